@@ -1,0 +1,123 @@
+#include "Paths.h"
+
+#include "Text.h"
+
+#include <algorithm>
+#include <filesystem>
+#include <system_error>
+
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace fs = std::filesystem;
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kSeparators = "/\\";
+
+fs::path NativePath(const std::string& path)
+{
+    return fs::path(std::u8string(path.begin(), path.end()));
+}
+
+std::string TextOf(const fs::path& path)
+{
+    const std::u8string text = path.u8string();
+    return {text.begin(), text.end()};
+}
+
+} // namespace
+
+CPathParts SplitPath(std::string_view path)
+{
+    const size_t nameBegin = path.find_last_of(kSeparators) + 1; // npos + 1 is 0
+    const std::string_view name = path.substr(nameBegin);
+    const std::string_view stem = name.substr(0, name.rfind('.'));
+    return {std::string(path.substr(0, nameBegin)), std::string(stem), std::string(name.substr(stem.size()))};
+}
+
+bool HasExtension(std::string_view path, std::string_view extension)
+{
+    return EqualNoCase(SplitPath(path).extension, extension);
+}
+
+std::string WithSeparator(std::string folder)
+{
+    if (!folder.empty() && kSeparators.find(folder.back()) == kSeparators.npos)
+        folder += kPathSeparator;
+    return folder;
+}
+
+bool FileExists(const std::string& path)
+{
+    std::error_code error;
+    const fs::file_status status = fs::status(NativePath(path), error);
+    return fs::exists(status) && !fs::is_directory(status);
+}
+
+bool FolderExists(const std::string& path)
+{
+    std::error_code error;
+    return fs::is_directory(NativePath(path), error);
+}
+
+bool FileSize(const std::string& path, uint64_t& byteCount)
+{
+    const fs::path native = NativePath(path);
+    std::error_code error;
+    if (!fs::is_regular_file(native, error))
+        return false;
+    const uintmax_t size = fs::file_size(native, error);
+    if (error)
+        return false;
+    byteCount = size;
+    return true;
+}
+
+bool IsReadOnly(const std::string& path)
+{
+    // The mode decides before access does: root may write a file without any write bit.
+    struct stat status;
+    if (stat(path.c_str(), &status) != 0)
+        return false;
+    return (status.st_mode & (S_IWUSR | S_IWGRP | S_IWOTH)) == 0 || access(path.c_str(), W_OK) != 0;
+}
+
+bool CreateFolder(const std::string& path)
+{
+    std::error_code error;
+    fs::create_directories(NativePath(path), error);
+    return FolderExists(path);
+}
+
+bool DeleteFile(const std::string& path)
+{
+    std::error_code error;
+    return FileExists(path) && fs::remove(NativePath(path), error);
+}
+
+std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension)
+{
+    std::vector<std::string> names;
+    std::error_code error;
+    fs::directory_iterator entry(NativePath(folder), error);
+    for (; !error && entry != fs::directory_iterator(); entry.increment(error))
+    {
+        std::error_code unreadable;
+        std::string name = TextOf(entry->path().filename());
+        if (HasExtension(name, extension) && entry->is_regular_file(unreadable))
+            names.push_back(std::move(name));
+    }
+    std::ranges::sort(names);
+    return names;
+}
+
+std::string ExecutableFolder()
+{
+    std::error_code error;
+    return SplitPath(TextOf(fs::read_symlink("/proc/self/exe", error))).folder;
+}
+
+} // namespace gw
