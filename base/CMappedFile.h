@@ -1,0 +1,37 @@
+#pragma once
+
+#include "CFailure.h"
+
+#include <cstddef>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+/// The bytes of a regular file, mapped and not copied. Folders and devices are refused. An empty file maps to no bytes.
+class CMappedFile
+{
+public:
+    CMappedFile() = default;
+    ~CMappedFile();
+    CMappedFile(CMappedFile&& other) noexcept;
+    CMappedFile& operator=(CMappedFile&& other) noexcept;
+    CMappedFile(const CMappedFile&) = delete;
+    CMappedFile& operator=(const CMappedFile&) = delete;
+
+    /// Replaces what was mapped. None on success, else why not; nothing is mapped then.
+    EFailure Open(const std::string& path);
+    void Close();
+
+    std::span<const std::byte> Bytes() const { return {m_pkBytes, m_uiSize}; }
+    std::string_view Text() const { return {reinterpret_cast<const char*>(m_pkBytes), m_uiSize}; }
+    /// Gives back the pages before an offset that will not be read again; they are read anew if they are.
+    void Forget(size_t endOffset);
+
+private:
+    const std::byte* m_pkBytes = nullptr;
+    size_t m_uiSize = 0;
+};
+
+} // namespace gw

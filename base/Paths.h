@@ -1,0 +1,49 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+/// A path in its parts. Both separators are understood; what is joined uses the platform's.
+struct CPathParts
+{
+    std::string folder;    ///< drive and directory with the trailing separator, or empty
+    std::string stem;      ///< file name without extension
+    std::string extension; ///< from the last dot on, dot included, or empty
+};
+
+inline constexpr char kPathSeparator =
+#ifdef _WIN32
+    '\\';
+#else
+    '/';
+#endif
+
+CPathParts SplitPath(std::string_view path);
+/// Whether a path's extension, dot included, equals the one asked for without regard to case.
+bool HasExtension(std::string_view path, std::string_view extension);
+/// A folder with a separator at its end; empty stays empty.
+std::string WithSeparator(std::string folder);
+
+/// Paths are UTF-8. An error of the file system counts as "no".
+bool FileExists(const std::string& path);
+bool FolderExists(const std::string& path);
+/// The size of a regular file in bytes; false when there is none or it cannot be examined.
+bool FileSize(const std::string& path, uint64_t& byteCount);
+/// Whether a file is there and read-only: no write bit in its mode, or not writable by the user.
+bool IsReadOnly(const std::string& path);
+/// Makes a folder with all above it; an existing one is no error.
+bool CreateFolder(const std::string& path);
+bool DeleteFile(const std::string& path);
+
+/// The names of the regular files in a folder whose extension (dot included) fits without regard to case, in name
+/// order, so that a run is the same everywhere.
+std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
+
+/// The folder of the running program with its trailing separator.
+std::string ExecutableFolder();
+
+} // namespace gw

@@ -1,0 +1,47 @@
+# Every folder is one target, made by these functions. A target sees the headers of its own folder and of the
+# targets that it names, and nothing else.
+
+find_program(GAITWRIGHT_CCACHE ccache)
+if(GAITWRIGHT_CCACHE)
+  set(CMAKE_CXX_COMPILER_LAUNCHER ${GAITWRIGHT_CCACHE})
+endif()
+
+# Compile options that every target of the project shares.
+function(gw_compile_options target)
+  # No contraction: the same source gives the same bits at every optimisation level.
+  target_compile_options(
+    ${target}
+    PRIVATE -ffp-contract=off
+            -Wall
+            -Wextra
+            -Wshadow
+            -Wconversion
+            -Wnon-virtual-dtor
+            -Woverloaded-virtual)
+  if(GAITWRIGHT_SANITIZE)
+    target_compile_options(${target} PRIVATE -O1 -fsanitize=address,undefined -fno-sanitize-recover=all
+                                             -fno-omit-frame-pointer -D_GLIBCXX_ASSERTIONS)
+    target_link_options(${target} PRIVATE -fsanitize=address,undefined)
+  endif()
+endfunction()
+
+# gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the present folder.
+function(gw_room name)
+  cmake_parse_arguments(ROOM "" "" "PUBLIC;PRIVATE" ${ARGN})
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  file(GLOB headers CONFIGURE_DEPENDS *.h)
+  add_library(${name} STATIC ${sources})
+  target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
+  target_link_libraries(${name} PUBLIC ${ROOM_PUBLIC} PRIVATE ${ROOM_PRIVATE})
+  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+  gw_compile_options(${name})
+endfunction()
+
+# gw_tests(NAME targets...): one test program of all sources in the present folder.
+function(gw_tests name)
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  add_executable(${name} ${sources})
+  target_link_libraries(${name} PRIVATE ${ARGN} gw_test_support GTest::gmock GTest::gtest_main)
+  gw_compile_options(${name})
+  gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 300)
+endfunction()

@@ -1,0 +1,36 @@
+#pragma once
+
+#include "Vec3.h"
+
+namespace gw {
+
+/// A rotation or row basis: nine floats, row-major, element m[3r + c]. Rows multiply from the left; in A · B the
+/// transform A acts first. A positive angle about kVec3UnitZ takes (1, 0, 0) to (cos a, sin a, 0).
+struct Mat3
+{
+    float m[9];
+
+    Vec3 Row(int row) const { return {m[3 * row], m[3 * row + 1], m[3 * row + 2]}; }
+    void SetRow(int row, const Vec3& v)
+    {
+        m[3 * row] = v.x;
+        m[3 * row + 1] = v.y;
+        m[3 * row + 2] = v.z;
+    }
+    /// Exact comparison, element by element.
+    friend bool operator==(const Mat3&, const Mat3&) = default;
+};
+
+inline constexpr Mat3 kMat3Identity{{1, 0, 0, 0, 1, 0, 0, 0, 1}};
+
+/// out := a · b; out may be a or b. Answers out.
+Mat3& Mat3Multiply(const Mat3& a, const Mat3& b, Mat3& out);
+Mat3 operator*(const Mat3& a, const Mat3& b);
+/// The rotation about an axis of unit length (not normalised here) by an angle in radians, into out.
+void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle);
+Mat3 Mat3FromAxisAngle(const Vec3& axis, float angle);
+Mat3 Mat3Transpose(const Mat3& a);
+/// The general inverse; the identity where there is none.
+Mat3 Mat3InverseOrIdentity(const Mat3& a);
+
+} // namespace gw

@@ -1,0 +1,54 @@
+#pragma once
+
+#include "Mat3.h"
+
+namespace gw {
+
+/// A transform: sixteen floats, row-major, translation in the last row, last column 0, 0, 0, 1.
+struct Mat4
+{
+    float m[16];
+
+    /// The first three elements of a row; row 3 is the translation.
+    Vec3 Row(int row) const { return {m[4 * row], m[4 * row + 1], m[4 * row + 2]}; }
+    Vec3 Translation() const { return Row(3); }
+    void SetTranslation(const Vec3& v)
+    {
+        m[12] = v.x;
+        m[13] = v.y;
+        m[14] = v.z;
+    }
+    /// Exact comparison, element by element.
+    friend bool operator==(const Mat4&, const Mat4&) = default;
+};
+
+inline constexpr Mat4 kMat4Identity{{1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1}};
+inline constexpr Mat4 kMat4Zero{};
+/// From the bones' frame to the limb solver's, and back: permutations with sign, inverse to each other.
+inline constexpr Mat4 AxisSwapForward{{0, -1, 0, 0, 0, 0, -1, 0, 1, 0, 0, 0, 0, 0, 0, 1}};
+inline constexpr Mat4 AxisSwapBack{{0, 0, 1, 0, -1, 0, 0, 0, 0, -1, 0, 0, 0, 0, 0, 1}};
+
+/// out := S · R · T. A null input stands for kMat3Identity, kVec3Zero, kVec3One.
+void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const Vec3* scale);
+Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scale = kVec3One);
+
+/// out := a · b; out may be a or b. With a null pointer nothing is written and null answered.
+Mat4* Mat4Multiply(Mat4* out, const Mat4* a, const Mat4* b);
+Mat4 operator*(const Mat4& a, const Mat4& b);
+
+/// The general inverse of m into out. Null, and out left alone, where the determinant is 0 or its reciprocal is not
+/// finite in 32 bits. A non-null determinant is written before any test.
+Mat4* Mat4Inverse(Mat4* out, float* determinant, const Mat4* m);
+/// The same with a result in every case: the identity where there is no inverse.
+Mat4 Mat4InverseOrIdentity(const Mat4& m);
+
+/// (v, 1) · m, divided by its fourth element unless that is 1 within kEpsilon. Null for an absent pointer.
+Vec3* TransformCoord(Vec3* out, const Vec3* v, const Mat4* m);
+Vec3 TransformCoord(const Vec3& v, const Mat4& m);
+
+/// Lengths of the first three rows: the scale of a transform.
+Vec3 RowLengths(const Mat4& m);
+/// The first three rows divided by their lengths: the rotation of a transform. A row of length 0 is kept.
+Mat3 NormalizedRows(const Mat4& m);
+
+} // namespace gw

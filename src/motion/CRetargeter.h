@@ -1,0 +1,79 @@
+#pragma once
+
+#include "CFailure.h"
+#include "CNode.h"
+#include "Mat3.h"
+#include "Vec3.h"
+
+#include <map>
+#include <memory>
+#include <string>
+
+namespace gw {
+
+/// Per-bone tuning of the target skeleton, from the share file.
+struct CBoneShares
+{
+    float m_fShare1 = 0.0f; ///< weight in the blend between the two decompositions
+    float m_fShare2 = 0.0f; ///< weight in the sine curve of the first rotation
+    float m_fType = 0.0f;   ///< decomposition: 0, 1 or any other, truncated
+};
+
+/// Turns the motion of a source skeleton into keyframes on the target skeleton. Told what to do by five tables keyed by
+/// target node; the nodes are looked at and not kept alive, so the trees must live as long as the tables are used.
+/// Row vectors; world position means the fourth row of a world matrix; lengths are in the skeletons' own units.
+class CRetargeter
+{
+public:
+    CRetargeter();
+    ~CRetargeter();
+    CRetargeter(const CRetargeter&) = delete;
+    CRetargeter& operator=(const CRetargeter&) = delete;
+
+    /// Stores the two roots and empties all tables but the shares.
+    void SetScenes(CNode* sourceRoot, CNode* targetRoot);
+    /// Empties all tables but the shares.
+    void ClearMaps();
+    /// Reads the share file of the target skeleton. False when it cannot be opened.
+    bool LoadShares(const std::string& path);
+
+    // Each replaces the entry of a key that is there and answers true.
+    bool SetSourceOf(CNode* target, CNode* source);
+    bool SetOffsetAngles(CNode* target, const Vec3& degrees);
+    bool SetOffsetMatrix(CNode* target, const Mat3& matrix);
+    bool SetFixed(CNode* target, bool fixed);
+    bool SetShares(CNode* target, const CBoneShares& shares);
+
+    // Lookups take null keys and absent ones, and insert nothing.
+    CNode* SourceOf(const CNode* node) const;
+    const Vec3& OffsetAngles(const CNode* node) const;
+    const Mat3& OffsetMatrix(const CNode* node) const;
+    bool IsFixed(const CNode* node, bool& fixed) const;
+    bool Shares(const CNode* node, const CBoneShares*& shares) const;
+
+    /// The source's size as a factor for the target, and how far the feet rise over the ground: leg plus pelvis
+    /// heights compared, bent by `weight`. Both trees stand in rest pose. Outputs are left alone where LFoot, RFoot or
+    /// LThigh has no source.
+    void MeasureBody(float& scale, float& footRise, float weight) const;
+
+    /// Poses the target frame by frame after the source and leaves a new track on every target node. `begin`, `last`,
+    /// `phase` and `frequency` go into the tracks; frames run from 0 through `last`. With `resetOrigin` the first frame
+    /// stands at `rootPosition`; with `useLegs` the limb solver plants the feet. Always true; see Record().
+    bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition, bool resetOrigin,
+                  bool useLegs);
+
+    /// What the last run was not happy with.
+    const CFailureRecord& Record() const { return m_kRecord; }
+
+private:
+    std::map<const CNode*, CBoneShares> m_kBoneShares;
+    std::map<const CNode*, CNode*> m_kSourceOf;
+    std::map<const CNode*, Vec3> m_kOffsetAngles;
+    std::map<const CNode*, bool> m_kFixedBones;
+    std::map<const CNode*, Mat3> m_kOffsetMatrices;
+    CNode* m_pkSourceRoot = nullptr;
+    CNode* m_pkTargetRoot = nullptr;
+    CFailureRecord m_kRecord;
+};
+
+} // namespace gw

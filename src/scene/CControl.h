@@ -1,0 +1,68 @@
+#pragma once
+
+#include "CObject.h"
+#include "Watch.h"
+
+namespace gw {
+
+/// How a control's time goes on outside its range. Any value but the named ones acts as Reverse.
+enum class ECycleType : uint32_t
+{
+    Clamp,
+    Loop,
+    Reverse,
+};
+
+/// An object that changes another one over time. A caller's time becomes a key time by frequency, phase and cycle type.
+class CControl : public CObject
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    CControl();
+    CControl(const CControl& source);
+    ~CControl() override;
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+
+    /// The controlled object, or null. It is not kept alive; when it dies the pointer becomes null.
+    CObject* GetTarget() const { return m_pkTarget.Get(); }
+    virtual void SetTarget(CObject* target) { m_pkTarget.Set(target); }
+    /// Rewrites the target's transform; true when it was rewritten.
+    virtual bool UpdateTransform(float time) = 0;
+    bool Update(float time) override = 0;
+    /// Ignores the range and updates.
+    bool UpdateRange(uint32_t range, float time) override;
+
+    CControl* GetNext() const { return m_spkNext.Get(); }
+    void SetNext(CControl* next) { m_spkNext = next; }
+    /// The end of the chain that begins here.
+    CControl* GetLast();
+
+    /// The key time of a caller's time: time x frequency + phase, brought into the range by the cycle type. A result
+    /// that is no number is the begin time.
+    float MapTime(float time) const;
+
+    uint32_t m_iCycleType = 0; ///< ECycleType, as stored
+    float m_fFrequency = 1.0f; ///< multiplies the caller's time; motions store the frame time in seconds here
+    float m_fBeginTime = 0.0f;
+    float m_fEndTime = 0.0f;
+    float m_fPhase = 0.0f; ///< added after the multiplication
+    bool m_bActive = true; ///< an inactive control does not animate
+
+private:
+    Watch<CObject> m_pkTarget;
+    Held<CControl> m_spkNext;
+};
+
+/// The class that links of a modifier chain must have. No concrete class derives from it, so no such object exists.
+class CModifier : public CControl
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+};
+
+} // namespace gw

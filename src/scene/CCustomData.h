@@ -1,0 +1,81 @@
+#pragma once
+
+#include "CObject.h"
+
+#include <cstddef>
+#include <span>
+
+namespace gw {
+
+/// A tagged object that a container carries without knowing what it means; a chain of them hangs on any object.
+class CCustomData : public CObject
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    CCustomData();
+    CCustomData(const CCustomData& source);
+    ~CCustomData() override;
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+
+    /// Stores a copy of a free text, or null, and the version as major x 100 + minor.
+    void SetCreator(const char* creator, uint32_t major, uint32_t minor);
+    const char* GetCreator() const { return m_pcCreator.Get(); }
+    uint32_t GetCreatorVersion() const { return m_uiCreatorVersion; }
+    /// A word that is free for the creator.
+    void SetUserWord(uint32_t word) { m_uiUserWord = word; }
+    uint32_t GetUserWord() const { return m_uiUserWord; }
+    CCustomData* GetNextData() const { return m_spkNextData.Get(); }
+    void SetNextData(CCustomData* next) { m_spkNextData = next; }
+
+private:
+    CText m_pcCreator;
+    uint32_t m_uiCreatorVersion = 0;
+    uint32_t m_uiUserWord = 0;
+    Held<CCustomData> m_spkNextData;
+};
+
+/// A block of bytes as custom data.
+class CRawData : public CCustomData
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    CRawData();
+    CRawData(const CRawData& source);
+    ~CRawData() override;
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    CObject* CreateClone() const override;
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+
+    /// Stores a copy of the bytes; none leave no block.
+    void SetData(std::span<const std::byte> bytes) { m_pbyData.assign(bytes.begin(), bytes.end()); }
+    void SetData(std::vector<std::byte>&& bytes) { m_pbyData = std::move(bytes); }
+    std::span<const std::byte> Data() const { return m_pbyData; }
+
+private:
+    std::vector<std::byte> m_pbyData;
+};
+
+/// Five texts about a file's author. Its class record names CObject as base although it is a CCustomData in all else.
+class CAuthorInfo : public CCustomData
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    CAuthorInfo();
+    CAuthorInfo(const CAuthorInfo& source);
+    ~CAuthorInfo() override;
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    CObject* CreateClone() const override;
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+
+private:
+    CText m_apcText[5];
+};
+
+} // namespace gw

@@ -1,0 +1,29 @@
+#include "CFactoryMap.h"
+
+namespace gw {
+
+CFactoryMap& CFactoryMap::Instance()
+{
+    static CFactoryMap map;
+    return map;
+}
+
+CObjectFactory CFactoryMap::Find(std::string_view className) const
+{
+    const auto entry = m_kFactory.find(className);
+    return entry == m_kFactory.end() ? nullptr : entry->second;
+}
+
+int RegisterClasses(std::span<const CFactoryRow> rows)
+{
+    for (const CFactoryRow& row : rows)
+        CFactoryMap::Instance().Set(row.m_pkRecord->m_pcName, row.m_pkFactory);
+    return static_cast<int>(rows.size());
+}
+
+CObject* MakeNothing(COrrinStream&)
+{
+    return nullptr;
+}
+
+} // namespace gw

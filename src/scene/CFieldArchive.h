@@ -1,0 +1,268 @@
+#pragma once
+
+#include "CText.h"
+#include "CVersion.h"
+#include "Mat4.h"
+#include "Quat.h"
+#include "Ref.h"
+#include "Vec3.h"
+#include "Watch.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <type_traits>
+#include <vector>
+
+namespace gw {
+
+/// What a stored value is. The names say how a value is shown; the sizes are those of the file.
+enum class EFieldKind : uint8_t
+{
+    Bool,       ///< 1 byte, 0 or 1
+    Byte,       ///< 1 byte
+    Word,       ///< 2 bytes
+    Unsigned,   ///< 4 bytes
+    Signed,     ///< 4 bytes
+    Float,      ///< 4 bytes
+    Vector,     ///< 12 bytes
+    Quaternion, ///< 16 bytes
+    Matrix,     ///< 64 bytes
+};
+
+/// Bytes of one value of a kind in a file, which is also its size in memory.
+constexpr size_t FieldBytes(EFieldKind kind)
+{
+    constexpr size_t kBytes[] = {1, 1, 2, 4, 4, 4, 12, 16, 64};
+    return kBytes[static_cast<size_t>(kind)];
+}
+
+/// The kind of a plain C++ type.
+template <class T>
+constexpr EFieldKind FieldKind()
+{
+    if constexpr (std::is_same_v<T, float>)
+        return EFieldKind::Float;
+    else if constexpr (std::is_same_v<T, Vec3>)
+        return EFieldKind::Vector;
+    else if constexpr (std::is_same_v<T, Quat>)
+        return EFieldKind::Quaternion;
+    else if constexpr (std::is_same_v<T, Mat4>)
+        return EFieldKind::Matrix;
+    else if constexpr (std::is_same_v<T, int32_t>)
+        return EFieldKind::Signed;
+    else if constexpr (std::is_same_v<T, uint32_t>)
+        return EFieldKind::Unsigned;
+    else if constexpr (std::is_same_v<T, uint16_t>)
+        return EFieldKind::Word;
+    else
+    {
+        static_assert(sizeof(T) == 1);
+        return EFieldKind::Byte;
+    }
+}
+
+/// One reference of an object to another, whatever its class: what an archive reads, writes, resolves or follows.
+class CLinkSlot
+{
+public:
+    template <class T>
+    static CLinkSlot Counted(Ref<T>& slot)
+    {
+        return {&slot, true, [](void* p) -> CObject* { return static_cast<Ref<T>*>(p)->Get(); },
+                [](void* p, CObject* object) { *static_cast<Ref<T>*>(p) = dynamic_cast<T*>(object); }};
+    }
+    template <class T>
+    static CLinkSlot Plain(Watch<T>& slot)
+    {
+        return {&slot, false, [](void* p) -> CObject* { return static_cast<Watch<T>*>(p)->Get(); },
+                [](void* p, CObject* object) { static_cast<Watch<T>*>(p)->Set(dynamic_cast<T*>(object)); }};
+    }
+
+    CObject* Get() const { return m_pkGet(m_pkSlot); }
+    /// An object of another class than the slot's becomes null.
+    void Set(CObject* object) const { m_pkSet(m_pkSlot, object); }
+    /// Whether the slot keeps its object alive. Only such links are registered, followed and cloned.
+    bool IsCounted() const { return m_bCounted; }
+
+private:
+    CLinkSlot(void* slot, bool counted, CObject* (*get)(void*), void (*set)(void*, CObject*))
+        : m_pkSlot(slot), m_pkGet(get), m_pkSet(set), m_bCounted(counted)
+    {
+    }
+
+    void* m_pkSlot;
+    CObject* (*m_pkGet)(void*);
+    void (*m_pkSet)(void*, CObject*);
+    bool m_bCounted;
+};
+
+/// What runs a class's list of stored fields. Each scene class names its fields once, base first, in file order, in
+/// CObject::Fields; the archives below this one read, write, count, resolve, follow and describe them.
+class CFieldArchive
+{
+public:
+    virtual ~CFieldArchive() = default;
+
+    /// True only while the fields are filled from a file: then values, sizes and counts change.
+    bool IsReading() const { return m_bReading; }
+    /// Whether the file has at least a version; always true where no old file is read.
+    bool AtLeast(CVersion version) const { return m_kVersion.AtLeast(version); }
+
+    void Bool(const char* name, bool& value) { Values(name, EFieldKind::Bool, &value, 1); }
+    void Byte(const char* name, uint8_t& value) { Values(name, EFieldKind::Byte, &value, 1); }
+    void Word(const char* name, uint16_t& value) { Values(name, EFieldKind::Word, &value, 1); }
+    void Unsigned(const char* name, uint32_t& value) { Values(name, EFieldKind::Unsigned, &value, 1); }
+    void Signed(const char* name, int32_t& value) { Values(name, EFieldKind::Signed, &value, 1); }
+    void Float(const char* name, float& value) { Values(name, EFieldKind::Float, &value, 1); }
+    void Vector(const char* name, Vec3& value) { Values(name, EFieldKind::Vector, &value, 1); }
+    void Matrix(const char* name, Mat4& value) { Values(name, EFieldKind::Matrix, &value, 1); }
+    /// Values in a row with no count of their own.
+    template <class R>
+    void Row(const char* name, R& values)
+    {
+        Values(name, FieldKind<typename R::value_type>(), values.data(), values.size());
+    }
+
+    /// A length and its characters.
+    virtual void Text(const char* name, CText& text) = 0;
+
+    template <class T>
+    void Link(const char* name, Ref<T>& slot)
+    {
+        Slot(name, CLinkSlot::Counted(slot));
+    }
+    template <class T>
+    void PlainLink(const char* name, Watch<T>& slot)
+    {
+        Slot(name, CLinkSlot::Plain(slot));
+    }
+    /// A count and a link for each element. Slot is Held<T> or Watch<T>.
+    template <class Slots>
+    void Links(const char* name, Slots& slots)
+    {
+        slots.resize(Count(name, slots.size(), 4));
+        LinkRow(name, slots);
+    }
+    /// Links in a row with no count of their own.
+    template <class Slots>
+    void LinkRow(const char* name, Slots& slots)
+    {
+        BeginArray(name, slots.size());
+        for (auto& slot : slots)
+        {
+            if constexpr (requires { slot.Set(nullptr); })
+                Slot(name, CLinkSlot::Plain(slot));
+            else
+                Link(name, slot);
+        }
+        EndArray();
+    }
+
+    /// A count and that many plain values in one copy.
+    template <class T>
+    void Block(const char* name, std::vector<T>& values)
+    {
+        values.resize(Count(name, values.size(), sizeof(T)));
+        Values(name, FieldKind<T>(), values.data(), values.size());
+    }
+    /// A presence word and, where it is not 0, `count` plain values. On reading, a negative count or a zero word leaves
+    /// the block empty.
+    template <class T>
+    void OptionalBlock(const char* name, std::vector<T>& values, int64_t count)
+    {
+        const bool present = Presence(name, !values.empty());
+        if (IsReading())
+            values.resize(present ? Fitting(count, sizeof(T)) : 0);
+        if (present)
+            Values(name, FieldKind<T>(), values.data(), values.size());
+    }
+
+    /// A count and a list of elements that have fields of their own: fields(archive, element).
+    template <class T, class F>
+    void Array(const char* name, std::vector<T>& elements, F fields);
+
+    /// A presence word of the file: any value but 0 means present. Answers what holds from here on.
+    virtual bool Presence(const char* name, bool present) = 0;
+    /// A 32-bit count of elements of at least `leastBytes` each. Reading answers the file's, or 0 and a failure where
+    /// the bytes that remain cannot hold them; every other archive answers `count`.
+    virtual size_t Count(const char* name, size_t count, size_t leastBytes) = 0;
+    /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is none.
+    virtual size_t Fitting(int64_t count, size_t elementBytes);
+    /// Marks a read as damaged here; fields that follow read as zeros.
+    virtual void Refuse() {}
+
+protected:
+    CFieldArchive(bool reading, CVersion version) : m_kVersion(version), m_bReading(reading) {}
+
+    virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
+    virtual void Slot(const char* name, const CLinkSlot& slot) = 0;
+    virtual void BeginArray(const char*, size_t) {}
+    virtual void EndArray() {}
+    virtual void BeginElement() {}
+    virtual void EndElement() {}
+
+private:
+    CVersion m_kVersion;
+    bool m_bReading;
+};
+
+/// Adds up the bytes that fields take in a file.
+class CFieldCounter : public CFieldArchive
+{
+public:
+    CFieldCounter() : CFieldArchive(false, kNewestVersion) {}
+
+    uint64_t ByteCount() const { return m_uiBytes; }
+    void Text(const char* name, CText& text) override;
+    bool Presence(const char* name, bool present) override;
+    size_t Count(const char* name, size_t count, size_t leastBytes) override;
+
+protected:
+    void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Slot(const char* name, const CLinkSlot& slot) override;
+
+private:
+    uint64_t m_uiBytes = 0;
+};
+
+template <class T, class F>
+void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
+{
+    T least{};
+    CFieldCounter counter;
+    fields(counter, least);
+    elements.resize(Count(name, elements.size(), static_cast<size_t>(counter.ByteCount())));
+    BeginArray(name, elements.size());
+    for (T& element : elements)
+    {
+        BeginElement();
+        fields(static_cast<CFieldArchive&>(*this), element);
+        EndElement();
+    }
+    EndArray();
+}
+
+/// Shows every counted link to a function, in file order, and passes over everything else.
+template <class F>
+class CLinkVisitor : public CFieldArchive
+{
+public:
+    explicit CLinkVisitor(F visit) : CFieldArchive(false, kNewestVersion), m_kVisit(visit) {}
+
+    void Text(const char*, CText&) override {}
+    bool Presence(const char*, bool present) override { return present; }
+    size_t Count(const char*, size_t count, size_t) override { return count; }
+
+protected:
+    void Values(const char*, EFieldKind, void*, size_t) override {}
+    void Slot(const char*, const CLinkSlot& slot) override
+    {
+        if (slot.IsCounted())
+            m_kVisit(slot);
+    }
+
+private:
+    F m_kVisit;
+};
+
+} // namespace gw

@@ -1,0 +1,89 @@
+#include "CFieldReader.h"
+
+#include <cstring>
+
+namespace gw {
+
+void CFieldReader::Fail(EFailure reason)
+{
+    m_kRecord.Fail(reason, m_uiPosition, m_pcClassName);
+}
+
+void CFieldReader::Refuse()
+{
+    Fail(EFailure::BadCount);
+}
+
+void CFieldReader::BeginObject(std::vector<uint32_t>& linkIDs, const char* className)
+{
+    m_pkLinkIDs = &linkIDs;
+    m_pcClassName = className;
+}
+
+uint32_t CFieldReader::ReadUnsigned()
+{
+    uint32_t value = 0;
+    Values("", EFieldKind::Unsigned, &value, 1);
+    return value;
+}
+
+std::string_view CFieldReader::ReadString()
+{
+    const size_t length = Fitting(ReadUnsigned(), 1);
+    const char* text = reinterpret_cast<const char*>(m_kBytes.data()) + m_uiPosition;
+    m_uiPosition += length;
+    return {text, length};
+}
+
+void CFieldReader::Text(const char*, CText& text)
+{
+    text.SetBytes(ReadString());
+}
+
+bool CFieldReader::Presence(const char*, bool)
+{
+    return ReadUnsigned() != 0;
+}
+
+size_t CFieldReader::Count(const char*, size_t, size_t leastBytes)
+{
+    return Fitting(ReadUnsigned(), leastBytes);
+}
+
+size_t CFieldReader::Fitting(int64_t count, size_t elementBytes)
+{
+    if (count <= 0 || IsDamaged())
+        return 0;
+    if (static_cast<uint64_t>(count) > Remaining() / elementBytes)
+    {
+        Fail(EFailure::BadCount);
+        return 0;
+    }
+    return static_cast<size_t>(count);
+}
+
+void CFieldReader::Values(const char*, EFieldKind kind, void* values, size_t count)
+{
+    const size_t byteCount = count * FieldBytes(kind);
+    if (byteCount == 0)
+        return;
+    if (IsDamaged() || byteCount > Remaining())
+    {
+        if (!IsDamaged())
+            Fail(EFailure::Truncated);
+        std::memset(values, 0, byteCount);
+        return;
+    }
+    if (kind == EFieldKind::Bool)
+        *static_cast<bool*>(values) = m_kBytes[m_uiPosition] != std::byte{0};
+    else
+        std::memcpy(values, m_kBytes.data() + m_uiPosition, byteCount);
+    m_uiPosition += byteCount;
+}
+
+void CFieldReader::Slot(const char*, const CLinkSlot&)
+{
+    m_pkLinkIDs->push_back(ReadUnsigned());
+}
+
+} // namespace gw

@@ -1,0 +1,52 @@
+#pragma once
+
+#include "CFailure.h"
+#include "CFieldArchive.h"
+
+#include <span>
+#include <string>
+
+namespace gw {
+
+/// Fills fields from the bytes of a container, and trusts none of them: what does not fit into the bytes that remain is
+/// damage, and from there on every field reads as zero.
+class CFieldReader : public CFieldArchive
+{
+public:
+    CFieldReader(std::span<const std::byte> bytes, size_t position, CVersion version, CFailureRecord& record)
+        : CFieldArchive(true, version), m_kBytes(bytes), m_uiPosition(position), m_kRecord(record)
+    {
+    }
+
+    void Text(const char* name, CText& text) override;
+    bool Presence(const char* name, bool present) override;
+    size_t Count(const char* name, size_t count, size_t leastBytes) override;
+    size_t Fitting(int64_t count, size_t elementBytes) override;
+    void Refuse() override;
+
+    /// A length and its characters, as a view into the bytes.
+    std::string_view ReadString();
+    uint32_t ReadUnsigned();
+
+    size_t Position() const { return m_uiPosition; }
+    bool AtEnd() const { return m_uiPosition >= m_kBytes.size(); }
+    bool IsDamaged() const { return static_cast<bool>(m_kRecord.Failure()); }
+    /// Where link ids go, and the class whose fields are read, for the failure record.
+    void BeginObject(std::vector<uint32_t>& linkIDs, const char* className);
+
+protected:
+    void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Slot(const char* name, const CLinkSlot& slot) override;
+
+private:
+    size_t Remaining() const { return m_kBytes.size() - m_uiPosition; }
+    void Fail(EFailure reason);
+
+    std::span<const std::byte> m_kBytes;
+    size_t m_uiPosition;
+    CFailureRecord& m_kRecord;
+    std::vector<uint32_t>* m_pkLinkIDs = nullptr;
+    const char* m_pcClassName = "";
+};
+
+} // namespace gw

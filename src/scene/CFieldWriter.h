@@ -1,0 +1,42 @@
+#pragma once
+
+#include "CFieldArchive.h"
+
+#include <functional>
+#include <span>
+#include <string_view>
+
+namespace gw {
+
+/// Where written bytes go. The answer is false when they could not be taken.
+using CByteSink = std::function<bool(std::span<const std::byte>)>;
+
+/// Writes fields as a container holds them. Small values are gathered, large blocks go to the sink as they are.
+class CFieldWriter : public CFieldArchive
+{
+public:
+    /// `linkID` gives the id that an object has in this file.
+    CFieldWriter(CByteSink sink, std::function<uint32_t(const CObject*)> linkID);
+
+    void Text(const char* name, CText& text) override;
+    bool Presence(const char* name, bool present) override;
+    size_t Count(const char* name, size_t count, size_t leastBytes) override;
+
+    void WriteString(std::string_view text);
+    void WriteUnsigned(uint32_t value);
+    void WriteBytes(std::span<const std::byte> bytes);
+    /// Hands the gathered bytes on. False when the sink has refused anything since the start.
+    bool Flush();
+
+protected:
+    void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Slot(const char* name, const CLinkSlot& slot) override;
+
+private:
+    CByteSink m_kSink;
+    std::function<uint32_t(const CObject*)> m_kLinkID;
+    std::vector<std::byte> m_kGathered;
+    bool m_bRefused = false;
+};
+
+} // namespace gw

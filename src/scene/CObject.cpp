@@ -1,0 +1,346 @@
+#include "CObject.h"
+
+#include "CControl.h"
+#include "CCustomData.h"
+#include "CFieldArchive.h"
+#include "COrrinStream.h"
+
+#include <cstring>
+
+namespace gw {
+
+uint8_t g_abObjectIDInUse[kObjectIDCount];
+uint32_t g_uiNextObjectID = 0;
+uint32_t g_uiObjectCount = 0;
+
+const CRTTI CObject::ms_kRTTI{"CObject", nullptr};
+
+namespace {
+
+constexpr size_t kChainCount = 3;
+
+std::vector<CLinkSlot> HeldSlots(CObject& object)
+{
+    std::vector<CLinkSlot> slots;
+    CLinkVisitor visitor([&](const CLinkSlot& slot) { slots.push_back(slot); });
+    object.Fields(visitor);
+    return slots;
+}
+
+CObject* CloneOf(CCloneMap& map, CObject* object)
+{
+    return object ? object->Clone(map) : nullptr;
+}
+
+// Modifier chains go on through a control's next link and end at the first object that is no modifier.
+template <class F>
+void ForEachModifier(CObject* head, F visit)
+{
+    for (CModifier* modifier = RecordCast<CModifier>(head); modifier;
+         modifier = RecordCast<CModifier>(modifier->GetNext()))
+        visit(*modifier);
+}
+
+template <class F>
+void UpdateChains(CObject& object, F update)
+{
+    for (CControl* control = object.GetControl(); control; control = control->GetNext())
+        update(*control);
+    ForEachModifier(object.GetModifier(), update);
+    for (CCustomData* data = object.GetCustomData(); data; data = data->GetNextData())
+        update(*data);
+}
+
+} // namespace
+
+bool IsDerivedFrom(const CObject& object, const CRTTI* record)
+{
+    for (const CRTTI* own = object.GetRTTI(); own; own = own->m_pkBase)
+    {
+        if (own == record)
+            return true;
+    }
+    return false;
+}
+
+CObject* DynamicCast(CObject& object, const CRTTI* record)
+{
+    return record && IsDerivedFrom(object, record) ? &object : nullptr;
+}
+
+CObject::CObject()
+{
+    TakeID();
+}
+
+CObject::CObject(const CObject& source) : m_pcName(source.m_pcName)
+{
+    TakeID();
+}
+
+CObject::~CObject()
+{
+    while (m_pkWatchers)
+        m_pkWatchers->Watch(nullptr);
+    g_abObjectIDInUse[m_uiID] = 0;
+    --g_uiObjectCount;
+    m_spkCustomData = nullptr;
+    m_spkModifier = nullptr;
+    m_spkControl = nullptr;
+}
+
+// The cursor stays on the id just taken: the next allocation finds it taken and steps over it, and an id that is freed
+// while the cursor stands on it is given out again at once.
+void CObject::TakeID()
+{
+    while (g_abObjectIDInUse[g_uiNextObjectID])
+        g_uiNextObjectID = (g_uiNextObjectID + 1) & (kObjectIDCount - 1);
+    m_uiID = g_uiNextObjectID;
+    g_abObjectIDInUse[m_uiID] = 1;
+    ++g_uiObjectCount;
+}
+
+void CObject::Release()
+{
+    if (--m_uiRefCount == 0)
+        delete this;
+}
+
+CObject* CObject::Clone(CCloneMap& map)
+{
+    const auto known = map.find(m_uiID);
+    if (known != map.end())
+        return known->second;
+    CObject* copy = CreateClone();
+    if (!copy)
+        return nullptr;
+    map[m_uiID] = copy;
+    CloneHeld(map, *copy);
+    return copy;
+}
+
+void CObject::CloneHeld(CCloneMap& map, CObject& copy)
+{
+    copy.AttachControl(static_cast<CControl*>(CloneOf(map, m_spkControl.Get())));
+    copy.m_spkModifier = CloneOf(map, m_spkModifier.Get());
+    copy.AttachCustomData(static_cast<CCustomData*>(CloneOf(map, m_spkCustomData.Get())));
+
+    // What comes behind the chains stands at the same place in both lists. A class whose copy starts with fewer slots
+    // (a node without children) fills in the rest itself.
+    const std::vector<CLinkSlot> from = HeldSlots(*this);
+    const std::vector<CLinkSlot> to = HeldSlots(copy);
+    for (size_t i = kChainCount; i < to.size() && i < from.size(); ++i)
+        to[i].Set(CloneOf(map, from[i].Get()));
+}
+
+void CObject::Fields(CFieldArchive& archive)
+{
+    archive.Text("m_pcName", m_pcName);
+    archive.Link("m_spkControl", m_spkControl);
+    if (archive.AtLeast({1, 1}))
+    {
+        archive.Link("m_spkModifier", m_spkModifier);
+        archive.Link("m_spkCustomData", m_spkCustomData);
+    }
+}
+
+void CObject::Load(COrrinStream& stream, CLinkRecord& record)
+{
+    stream.ReadObject(*this, record);
+}
+
+void CObject::Link(COrrinStream& stream, CLinkRecord& record)
+{
+    stream.ResolveLinks(*this, record);
+}
+
+bool CObject::Register(COrrinStream& stream)
+{
+    if (!stream.AppendToSaveList(*this))
+        return false;
+    for (CObject* held : HeldObjects())
+        held->Register(stream);
+    return true;
+}
+
+void CObject::Save(COrrinStream& stream)
+{
+    stream.WriteObject(*this);
+}
+
+uint64_t CObject::GetMemoryUsed() const
+{
+    return 32 + m_pcName.MemoryUsed();
+}
+
+uint64_t CObject::GetDiskUsed() const
+{
+    CFieldCounter counter;
+    const_cast<CObject*>(this)->Fields(counter); // counting changes nothing
+    return 4 + std::strlen(GetRTTI()->m_pcName) + 4 + counter.ByteCount();
+}
+
+bool CObject::Update(float time)
+{
+    UpdateChains(*this, [=](CObject& object) { object.Update(time); });
+    return true;
+}
+
+bool CObject::UpdateRange(uint32_t range, float time)
+{
+    UpdateChains(*this, [=](CObject& object) { object.UpdateRange(range, time); });
+    return true;
+}
+
+bool CObject::Fits(const char* name, const CRTTI* record, bool derived) const
+{
+    if (record && !(derived ? IsDerivedFrom(*this, record) : GetRTTI() == record))
+        return false;
+    return !name || (!m_pcName.IsNull() && m_pcName.View() == name);
+}
+
+// Collected first and visited then, so that walks which recurse spend one small frame a level.
+std::vector<CObject*> CObject::HeldObjects()
+{
+    std::vector<CObject*> held;
+    CLinkVisitor visitor([&](const CLinkSlot& slot) {
+        if (CObject* object = slot.Get())
+            held.push_back(object);
+    });
+    Fields(visitor);
+    return held;
+}
+
+CObject* CObject::FindObject(const char* name, const CRTTI* record, bool derived)
+{
+    if (Fits(name, record, derived))
+        return this;
+    for (CObject* held : HeldObjects())
+    {
+        if (CObject* found = held->FindObject(name, record, derived))
+            return found;
+    }
+    return nullptr;
+}
+
+void CObject::FindObjects(std::vector<CObject*>& found, const char* name, const CRTTI* record, bool derived)
+{
+    if (Fits(name, record, derived))
+        found.push_back(this);
+    for (CObject* held : HeldObjects())
+        held->FindObjects(found, name, record, derived);
+}
+
+bool CObject::Bind(CObject& root)
+{
+    for (CObject* held : HeldObjects())
+        held->Bind(root);
+    return true;
+}
+
+bool CObject::Rebind(const CCloneMap& map)
+{
+    for (CObject* held : HeldObjects())
+        held->Rebind(map);
+    return true;
+}
+
+bool CObject::BindChains(CObject& root)
+{
+    for (CObject* head : {static_cast<CObject*>(m_spkControl.Get()), m_spkModifier.Get(),
+                          static_cast<CObject*>(m_spkCustomData.Get())})
+    {
+        if (head)
+            head->Bind(root);
+    }
+    return true;
+}
+
+bool CObject::RebindChains(const CCloneMap& map)
+{
+    for (CObject* head : {static_cast<CObject*>(m_spkControl.Get()), m_spkModifier.Get(),
+                          static_cast<CObject*>(m_spkCustomData.Get())})
+    {
+        if (head)
+            head->Rebind(map);
+    }
+    return true;
+}
+
+bool CObject::AttachControl(CControl* control)
+{
+    if (!control || control->GetTarget())
+        return false;
+    for (CControl* link = control; link; link = link->GetNext())
+        link->SetTarget(this);
+    if (!m_spkControl)
+        m_spkControl = control;
+    else if (CControl* last = m_spkControl->GetLast(); last != control)
+        last->SetNext(control);
+    return true;
+}
+
+bool CObject::AttachModifier(CControl* modifier)
+{
+    if (!modifier || modifier->GetTarget())
+        return false;
+    for (CControl* link = modifier; link; link = link->GetNext())
+        link->SetTarget(this);
+    if (!m_spkModifier)
+    {
+        m_spkModifier = modifier;
+        return true;
+    }
+    CModifier* last = nullptr;
+    ForEachModifier(m_spkModifier.Get(), [&](CModifier& link) { last = &link; });
+    if (last && last != modifier)
+        last->SetNext(modifier);
+    return true;
+}
+
+bool CObject::AttachCustomData(CCustomData* data)
+{
+    if (!data)
+        return false;
+    if (!m_spkCustomData)
+    {
+        m_spkCustomData = data;
+        return true;
+    }
+    CCustomData* last = dynamic_cast<CCustomData*>(
+        m_spkControl ? static_cast<CObject*>(m_spkControl->GetLast()) : nullptr);
+    if (!last)
+        return false;
+    last->SetNextData(data);
+    return true;
+}
+
+void CObject::DetachControls()
+{
+    for (CControl* control = m_spkControl.Get(); control; control = control->GetNext())
+        control->SetTarget(nullptr);
+    m_spkControl = nullptr;
+}
+
+void CWatcher::Watch(CObject* object)
+{
+    if (object == m_pkObject)
+        return;
+    if (m_pkObject)
+    {
+        (m_pkPrevious ? m_pkPrevious->m_pkNext : m_pkObject->m_pkWatchers) = m_pkNext;
+        if (m_pkNext)
+            m_pkNext->m_pkPrevious = m_pkPrevious;
+    }
+    m_pkObject = object;
+    m_pkPrevious = nullptr;
+    m_pkNext = nullptr;
+    if (!object)
+        return;
+    m_pkNext = object->m_pkWatchers;
+    if (m_pkNext)
+        m_pkNext->m_pkPrevious = this;
+    object->m_pkWatchers = this;
+}
+
+} // namespace gw

@@ -1,0 +1,31 @@
+#pragma once
+
+#include "CObject.h"
+
+namespace gw {
+
+/// A plain pointer of one scene object to another that holds no count and becomes null when the other dies. Like Held
+/// it is not copied with its holder.
+template <class T>
+class Watch
+{
+public:
+    Watch() = default;
+    Watch(const Watch&) {}
+    Watch& operator=(const Watch& other)
+    {
+        Set(other.Get());
+        return *this;
+    }
+    ~Watch() = default;
+
+    T* Get() const { return static_cast<T*>(m_kWatcher.Object()); }
+    T* operator->() const { return Get(); }
+    explicit operator bool() const { return Get() != nullptr; }
+    void Set(T* object) { m_kWatcher.Watch(object); }
+
+private:
+    CWatcher m_kWatcher;
+};
+
+} // namespace gw
