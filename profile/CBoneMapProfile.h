@@ -9,8 +9,9 @@ namespace gw {
 class CNode;
 class CRetargeter;
 
-/// A bone-map profile as the program around it sees it: which source bone drives which target bone. The bodies here
-/// are defaults; the profile editor's model gives the real ones. Scenes are looked at and not kept alive.
+/// A bone-map profile as the program around it sees it: which source bone drives which target bone. The
+/// bodies here are defaults; the profile editor's model gives the real ones. Scenes are looked at and not
+/// kept alive.
 class CBoneMapProfile
 {
 public:

@@ -5,6 +5,8 @@
 
 namespace gw {
 
+class CBoneOffsetDialog;
+
 /// Button sets of a message box, with the numbers that they have always had.
 enum class EButtons : int
 {
@@ -23,7 +25,8 @@ enum class EAnswer : int
     No = 7,
 };
 
-/// What the profile editor asks of the program around it. No toolkit stands behind it but the one that implements it.
+/// What the profile editor asks of the program around it. No toolkit stands behind it but the one that
+/// implements it.
 class CProfileOwner
 {
 public:
@@ -41,6 +44,9 @@ public:
     virtual std::string ProfileFile(const std::string& name) = 0;
     /// The full path of a name beside the executable.
     virtual std::string ExeFile(const std::string& name) = 0;
+    /// Shows the offset dialog until the user ends it: true on OK, false on Cancel and where no window can
+    /// show it.
+    virtual bool RunBoneOffset(CBoneOffsetDialog&) { return false; }
 };
 
 } // namespace gw

@@ -1,0 +1,87 @@
+#pragma once
+
+#include "AxisCodes.h"
+#include "Vec3.h"
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+class CMapRowTable;
+
+/// Stands in the source column of a row whose target bone takes no source.
+inline constexpr std::string_view kFixedSource = "[FIXED]";
+
+/// The most bytes that a profile may have; a full skeleton takes a fiftieth of this.
+inline constexpr size_t kProfileByteLimit = 256 * 1024;
+
+/// The display name of a profile: the first line of its file, cut at the end. Empty when the file cannot be
+/// read.
+std::string ReadProfileName(const std::string& path);
+
+/// The bytes of a profile. False when the file cannot be read or is longer than a profile can be.
+bool ReadProfileText(const std::string& path, std::string& text);
+
+/// What a row says beside its two names.
+struct CRowNumbers
+{
+    std::array<int, 3> rotation{}; ///< X, Y, Z in degrees
+    AxisCodes axes = kNeutralAxes;
+
+    friend bool operator==(const CRowNumbers&, const CRowNumbers&) = default;
+};
+
+enum class EProfileLine : uint8_t
+{
+    Position,
+    FrameRate,
+    Fixed,   ///< a target bone without a source
+    Mapping, ///< a source bone that drives a target bone
+};
+
+/// One line of a profile behind the first. Only the members of its kind say something.
+struct CProfileLine
+{
+    EProfileLine kind = EProfileLine::Mapping;
+    size_t line = 0; ///< in the file, from 1 on
+    Vec3 position = kVec3Zero;
+    int frameRate = 0;
+    std::string source; ///< kFixedSource in a fixed row
+    std::string target;
+    CRowNumbers numbers;
+};
+
+/// Reads the text of a profile line by line. Never fails: a line with too few tokens takes the missing ones
+/// from the line before, and one that fits no other kind is a mapping row.
+class CProfileReader
+{
+public:
+    /// The text must outlive the reader.
+    explicit CProfileReader(std::string_view text);
+
+    const std::string& Name() const { return m_kName; }
+    /// False at the end of the file.
+    bool Next(CProfileLine& line);
+
+private:
+    static constexpr size_t kTokenCount = 4;
+
+    bool NextPiece(std::string_view& piece);
+    void TakeTokens(std::string_view piece);
+
+    std::string_view m_kRest;
+    std::string m_kName;
+    std::array<std::string, kTokenCount> m_kToken; // not cleared between lines
+    size_t m_uiLine = 1;
+    bool m_bInsideLine = false;
+};
+
+/// The whole text of a profile file. The name is written as it is; the position is cut to integers toward
+/// zero.
+std::string ProfileText(std::string_view name, int frameRate, const Vec3& position, const CMapRowTable& rows);
+
+} // namespace gw
