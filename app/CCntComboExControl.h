@@ -1,0 +1,50 @@
+#pragma once
+
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// The list of profiles: texts with a number each, at most one of them selected.
+class CCntComboExControl
+{
+public:
+    virtual ~CCntComboExControl() = default;
+
+    virtual void AddItem(const std::string& text, int userData) = 0;
+    /// Deletes one entry, or with -1 all.
+    virtual void DeleteItem(int index) = 0;
+    /// The selected index, or -1.
+    virtual int GetCurSel() const = 0;
+    /// Selects without the notification that a choice by hand gives; -1 selects none.
+    virtual void SetCurSel(int index) = 0;
+    /// The text of an entry, valid until the list changes; null for an index out of range.
+    virtual const std::string* GetItemText(int index) const = 0;
+    virtual int GetItemUserData(int index) const = 0;
+};
+
+/// The list by itself, with nothing on a screen. A window may show it after every change.
+class CProfileList : public CCntComboExControl
+{
+public:
+    void AddItem(const std::string& text, int userData) override;
+    void DeleteItem(int index) override;
+    int GetCurSel() const override { return m_iSelected; }
+    void SetCurSel(int index) override;
+    const std::string* GetItemText(int index) const override;
+    int GetItemUserData(int index) const override;
+
+private:
+    struct Item
+    {
+        std::string m_kText;
+        int m_iUserData;
+    };
+
+    bool Has(int index) const;
+
+    std::vector<Item> m_kItems;
+    int m_iSelected = -1;
+};
+
+} // namespace gw

@@ -1,0 +1,189 @@
+#pragma once
+
+#include "CMotionFile.h"
+#include "CMotionView.h"
+#include "COrrinStream.h"
+#include "CProfileOwner.h"
+#include "CResourceManager.h"
+#include "CRetargeter.h"
+
+#include <cstdint>
+#include <memory>
+#include <span>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+class CBoneMapProfile;
+class CContentWindow;
+class CPlatform;
+class CProfileEditorDialog;
+struct CFolderChoice;
+
+/// Where the target's root stands in the rest pose and in the first frame, in the target skeleton's own unit.
+inline constexpr Vec3 kRootPosition{0.0f, 923.0f, 13.0f};
+
+/// The conversion from opening a source to saving the result, as a state machine without a window: commands
+/// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
+/// when they failed and 1 otherwise, also when a dialog was cancelled.
+class CGaitConvertContent : public CProfileOwner
+{
+public:
+    /// Both ports must outlive the content.
+    CGaitConvertContent(CContentWindow& window, CPlatform& platform);
+    ~CGaitConvertContent() override;
+    CGaitConvertContent(const CGaitConvertContent&) = delete;
+    CGaitConvertContent& operator=(const CGaitConvertContent&) = delete;
+
+    /// Makes views, profile list and profile editor. False when the window gave no view; all else works
+    /// without one.
+    bool OnInitContent();
+
+    // The workflow
+
+    /// The command of a clicked child. True when the click is to be passed on to the window's own handling.
+    bool ChildClick(std::string_view child);
+    int OpenSource();
+    int ConvertMotion();
+    int SaveResult();
+    int RunBatch();
+    /// The result, written and packaged as the path's extension says. Replaces what is there. False when
+    /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
+    /// reported.
+    bool WriteResult(const std::string& path);
+    /// Whether the present result may be dropped; asks when it is not saved.
+    bool ConfirmDiscard();
+    /// Asks the editor, then for the result: whether the window may close.
+    bool MayClose();
+    /// Brings the enabled state of every child up to date.
+    void UpdateControls();
+
+    // Playback: what the window's timers and its scroll bar deliver
+
+    void OnTimer(int id);
+    void ChildMouseDown(std::string_view child);
+    void ChildMouseUp(std::string_view child);
+    void ChildScroll(std::string_view child, int value);
+
+    // Profiles
+
+    /// A notification of the profile list; code 9 is a choice by hand.
+    void OnCntCommand(int code);
+    void DeleteSelectedProfile();
+    void RefreshProfileList();
+    void PruneProfileList();
+    void SelectProfileByName(const std::string& name);
+    void PickStockProfile();
+
+    EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
+    void ProfileStateChanged() override;
+    void ProfileSetChanged() override;
+    std::string FindProfilePath(const std::string& name) override;
+    std::string ProfileFile(const std::string& name) override;
+    std::string ExeFile(const std::string& name) override;
+
+    // Help
+
+    /// The host product's executable; says so when there is none.
+    bool LocateHost(std::string& path);
+    /// The host product's help file; true with an empty path when its library names none.
+    bool LocateHelp(std::string& path);
+    void ShowHelp();
+
+    // What stands
+
+    /// The text of a message; see CResourceManager.
+    std::string Message(int id) const;
+    /// The window's title: the product's name, and behind it a text if there is one.
+    void SetTitle(const std::string& text);
+    CBoneMapProfile* Profile() const { return m_pkProfile; }
+    CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
+    /// The root of the open source, be it a motion file's or a container's; null when nothing is open.
+    CNode* SourceRoot() const;
+    const CMotionFile& ResultMotion() const { return m_kResultMotion; }
+    bool IsConverted() const { return m_bConverted; }
+    bool IsSaved() const { return m_bSaved; }
+    const std::string& ProfilePath() const { return m_kProfilePath; }
+
+private:
+    struct Command;
+    struct ControlState;
+    struct Timing;
+    class CWaitCursor;
+
+    // CGaitConvertContent.cpp
+    bool LoadSource(const std::string& path);
+    bool LoadSourceScene(const std::string& path);
+    bool LoadMotion(CMotionFile& motion, const std::string& path);
+    void LoadTarget();
+    void ShowSource();
+    void HandScenesToProfile();
+    void RememberFolder(const std::string& path);
+    void SetResultScene();
+    CNode* ContainerRoot() const;
+
+    // ConvertMotion.cpp
+    bool Retarget(bool useLegs);
+    bool CanRetarget();
+    Timing SourceTiming() const;
+    void NormalizeBasePose();
+    void ReportMisfit();
+
+    // SaveResult.cpp
+    bool WritePackage(const std::string& path, float frameScale);
+    bool SaveMotion(const std::string& path, float frameScale);
+
+    // ConvertBatch.cpp
+    enum class EBatchStep : uint8_t;
+    EBatchStep ConvertFile(const std::string& path);
+    EBatchStep PackageFile(const std::string& path);
+    bool SelectProfileAgain();
+
+    // ControlStates.cpp
+    uint32_t ControlFacts() const;
+    void ShowHighlights();
+
+    // Commands.cpp
+    template <auto Operation>
+    void OnBothViews();
+    template <auto Operation>
+    void OnResultView();
+    void TogglePlay();
+    void StopAndRewind();
+    void PlayResult();
+    void OpenOrBatch();
+    void ToggleProfileEditor();
+
+    // ProfileList.cpp
+    void AddProfiles(const std::string& folder, int userData);
+    void ChooseProfile();
+    bool ProfileFits(const std::string& path);
+    bool IsListed(const std::string& name) const;
+
+    // Reports.cpp
+    void Report(const std::string& path, const CFailureRecord& record);
+
+    CContentWindow& m_kWindow;
+    CPlatform& m_kPlatform;
+    CResourceManager m_kResources;
+    std::unique_ptr<CProfileEditorDialog> m_pkProfileDialog;
+    bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
+    COrrinStream m_spkSourceScene;     ///< a source read from a container
+    CMotionFile m_kSourceMotion;
+    CMotionFile m_kBaseMotion;   ///< base.htr as it is, for the editor's target tree
+    CMotionFile m_kResultMotion; ///< base.htr again, into which the motion is baked
+    CRetargeter m_kRetargeter;
+    std::unique_ptr<CMotionView> m_pkSourceView;
+    std::unique_ptr<CMotionView> m_pkResultView;
+    std::string m_kProfilePath; ///< of the profile selected in the list; empty means none
+    std::string m_kPoserProfileName;
+    std::string m_kMaxProfileName;
+    std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
+    bool m_bConverted = false;                ///< a conversion has been made for the open source
+    bool m_bSaved = true;                     ///< the result has been saved, or there was none
+    CBoneMapProfile* m_pkProfile = nullptr;   ///< the editor's
+};
+
+} // namespace gw
