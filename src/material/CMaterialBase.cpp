@@ -1,0 +1,21 @@
+#include "CMaterialBase.h"
+
+#include "CFieldArchive.h"
+
+namespace gw {
+
+const CRTTI CMaterialBase::ms_kRTTI{"CMaterialBase", &CObject::ms_kRTTI};
+const CRTTI CMaterial::ms_kRTTI{"CMaterial", &CMaterialBase::ms_kRTTI};
+
+void CMaterialBase::Fields(CFieldArchive& archive)
+{
+    CObject::Fields(archive);
+    archive.Bool("m_bTwoSided", m_bTwoSided);
+}
+
+uint64_t CMaterialBase::GetMemoryUsed() const
+{
+    return CObject::GetMemoryUsed() + 4;
+}
+
+} // namespace gw
