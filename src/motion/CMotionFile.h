@@ -4,13 +4,16 @@
 #include "CNode.h"
 #include "CTextLines.h"
 
+#include <functional>
 #include <string>
-#include <string_view>
 
 namespace gw {
 
-/// The one door through which motions are loaded and saved, and the base class of the streams behind it. A loaded
-/// motion is a tree of nodes with one track and one bone mesh each; frame f is reached at time f / GetFrequency().
+class CLineWriter;
+
+/// The one door through which motions are loaded and saved, and the base class of the streams behind it. A
+/// loaded motion is a tree of nodes with one track and one bone mesh each; frame f is reached at time f /
+/// GetFrequency().
 class CMotionFile
 {
 public:
@@ -20,11 +23,12 @@ public:
     CMotionFile& operator=(const CMotionFile&) = delete;
     virtual ~CMotionFile();
 
-    /// Chooses a stream by the extension without regard to case, and takes its trees over on success; on failure the
-    /// trees stay as they were. Another extension is true where a motion is held already, else false. Leaves the tree
-    /// evaluated at time 0.
+    /// Chooses a stream by the extension without regard to case, and takes its trees over on success; on
+    /// failure the trees stay as they were. Another extension is true where a motion is held already, else
+    /// false. Leaves the tree evaluated at time 0.
     virtual bool Load(const std::string& path);
-    /// Writes an HTR file with frameScale times as many frames; false for every other extension and for failures.
+    /// Writes an HTR file with frameScale times as many frames; false for every other extension and for
+    /// failures.
     virtual bool Save(const std::string& path, float frameScale);
 
     /// The end time of the first control, in frames, or 0.
@@ -43,12 +47,15 @@ public:
 protected:
     /// Maps a text file and rewinds. False for an empty path or a file that cannot be read.
     bool ReadLines(const std::string& path);
-    /// Writes `text` out, in one step. False for an empty path or a file that cannot be written.
-    bool WriteLines(const std::string& path);
+    /// Replaces a file by the lines that `append` writes, in one step. False for an empty path, for a file
+    /// that cannot be written, and where `append` gives up; the old file stands then.
+    bool WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append);
 
-    CTextLines lines;          ///< the text being read
-    std::string text;          ///< the text being written, each line with its line feed
+    CTextLines lines; ///< the text being read
     CFailureRecord m_kRecord;
+
+private:
+    bool LoadBy(CMotionFile& stream, const std::string& path);
 };
 
 /// Switches every control under a node on or off. Switched off, a track gives its node the rest pose.

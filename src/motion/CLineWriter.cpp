@@ -1,0 +1,72 @@
+#include "CLineWriter.h"
+
+#include <cmath>
+#include <cstring>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kLineEnd =
+#ifdef _WIN32
+    "\r\n";
+#else
+    "\n";
+#endif
+
+} // namespace
+
+void CLineWriter::Flush()
+{
+    m_kFile.Write(std::string_view(m_kBuffer.data(), m_uiUsed)); // a failure stays with the file until Commit
+    m_uiUsed = 0;
+}
+
+// Where that many bytes can be written.
+char* CLineWriter::Room(size_t byteCount)
+{
+    if (m_kBuffer.size() - m_uiUsed < byteCount)
+        Flush();
+    if (m_kBuffer.size() < byteCount)
+        m_kBuffer.resize(byteCount);
+    return m_kBuffer.data() + m_uiUsed;
+}
+
+CLineWriter& CLineWriter::Text(std::string_view text)
+{
+    std::memcpy(Room(text.size()), text.data(), text.size());
+    m_uiUsed += text.size();
+    return *this;
+}
+
+CLineWriter& CLineWriter::Int(int32_t value)
+{
+    char* const begin = Room(kIntBytes);
+    m_uiUsed += static_cast<size_t>(WriteInt(begin, value) - begin);
+    return *this;
+}
+
+CLineWriter& CLineWriter::Number(float value)
+{
+    char* const begin = Room(kFixed6Bytes);
+    m_uiUsed += static_cast<size_t>(WriteFixed6(begin, std::isfinite(value) ? value : 0.0f) - begin);
+    return *this;
+}
+
+void CLineWriter::EndLine()
+{
+    Text(kLineEnd);
+}
+
+void CLineWriter::Line(std::string_view text)
+{
+    Text(text).EndLine();
+}
+
+bool CLineWriter::Commit()
+{
+    Flush();
+    return m_kFile.Commit();
+}
+
+} // namespace gw

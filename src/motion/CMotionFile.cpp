@@ -1,0 +1,128 @@
+#include "CMotionFile.h"
+
+#include "CKeyframeControl.h"
+#include "CLineWriter.h"
+#include "Paths.h"
+
+#include <memory>
+#include <new>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+namespace {
+
+struct StreamRow
+{
+    std::string_view extension;
+    std::unique_ptr<CMotionFile> (*make)();
+    bool hasRestTree;
+};
+
+const StreamRow* FindStream(const std::string&)
+{
+    return nullptr;
+}
+
+// The first control of a class in a tree, or null.
+template <class T>
+T* FirstControl(const Ref<CNode>& root)
+{
+    return root ? static_cast<T*>(root->FindObject(nullptr, &T::ms_kRTTI, true)) : nullptr;
+}
+
+} // namespace
+
+CMotionFile::CMotionFile() = default;
+CMotionFile::~CMotionFile() = default;
+
+CMotionFile::CMotionFile(const CMotionFile& trees)
+    : restRoot(trees.restRoot), motionRoot(trees.motionRoot), fileVersion(trees.fileVersion)
+{
+}
+
+bool CMotionFile::LoadBy(CMotionFile& stream, const std::string& path)
+{
+    bool loaded = false;
+    try
+    {
+        loaded = stream.Load(path);
+    } catch (const std::bad_alloc&) // sizes are bounded by the file's; a machine may still have less
+    {
+        stream.m_kRecord.Fail(EFailure::OutOfMemory);
+    }
+    m_kRecord = stream.m_kRecord;
+    return loaded;
+}
+
+bool CMotionFile::Load(const std::string& path)
+{
+    m_kRecord.Clear();
+    if (path.empty())
+        return m_kRecord.Fail(EFailure::NotFound);
+    if (const StreamRow* row = FindStream(path))
+    {
+        const auto stream = row->make();
+        if (!LoadBy(*stream, path))
+            return false;
+        motionRoot = stream->motionRoot;
+        fileVersion = stream->fileVersion;
+        if (row->hasRestTree)
+            restRoot = stream->restRoot;
+    }
+    if (!motionRoot)
+        return m_kRecord.Fail(EFailure::UnknownFormat);
+    motionRoot->UpdateScene(0.0f, true);
+    return true;
+}
+
+bool CMotionFile::Save(const std::string& path, float)
+{
+    m_kRecord.Clear();
+    return m_kRecord.Fail(path.empty() ? EFailure::NotFound : EFailure::UnknownFormat);
+}
+
+float CMotionFile::GetLastFrame() const
+{
+    const auto* control = FirstControl<CControl>(motionRoot);
+    return control ? control->m_fEndTime : 0.0f;
+}
+
+float CMotionFile::GetFrequency() const
+{
+    const auto* control = FirstControl<CControl>(motionRoot);
+    return control ? control->m_fFrequency : 0.0f;
+}
+
+int CMotionFile::GetKeyCount() const
+{
+    const auto* track = FirstControl<CKeyframeControl>(motionRoot);
+    return track ? static_cast<int>(track->m_kKeyTimes.size()) : 0;
+}
+
+bool CMotionFile::ReadLines(const std::string& path)
+{
+    const EFailure failure = path.empty() ? EFailure::NotFound : lines.Open(path);
+    return failure == EFailure::None || m_kRecord.Fail(failure);
+}
+
+bool CMotionFile::WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append)
+{
+    CLineWriter writer;
+    if (path.empty() || !writer.Open(path))
+        return m_kRecord.Fail(EFailure::WriteError);
+    if (!append(writer))
+        return false;
+    return writer.Commit() || m_kRecord.Fail(EFailure::WriteError);
+}
+
+void SwitchControls(CNode& root, bool active)
+{
+    std::vector<CObject*> found;
+    root.FindObjects(found, nullptr, &CControl::ms_kRTTI, true);
+    for (CObject* object : found)
+        static_cast<CControl*>(object)->m_bActive = active;
+}
+
+} // namespace gw

@@ -1,0 +1,76 @@
+#include "CTextLines.h"
+
+#include "Text.h"
+
+namespace gw {
+
+namespace {
+
+// The characters before a line feed, without the carriage return that belongs to it.
+std::string_view CutLineEnd(std::string_view text, size_t feed)
+{
+    const bool pair = feed > 0 && text[feed - 1] == '\r';
+    return text.substr(0, pair ? feed - 1 : feed);
+}
+
+} // namespace
+
+EFailure CTextLines::Open(const std::string& path)
+{
+    m_kNow = m_kBefore = {};
+    const EFailure failure = m_kFile.Open(path);
+    m_kNow.m_uiOffset = m_kFile.Text().size() - SkipByteOrderMark(m_kFile.Text()).size();
+    return failure;
+}
+
+void CTextLines::Close()
+{
+    m_kFile.Close();
+    m_kNow = m_kBefore = {};
+}
+
+void CTextLines::StepBack()
+{
+    m_kNow = m_kBefore;
+}
+
+// What is left of the text. A line number begins with the first piece of a line.
+std::string_view CTextLines::BeginRead()
+{
+    m_kBefore = m_kNow;
+    const std::string_view rest = m_kFile.Text().substr(m_kNow.m_uiOffset);
+    if (!rest.empty() && !m_kNow.m_bInsideLine)
+        ++m_kNow.m_uiLine;
+    return rest;
+}
+
+bool CTextLines::Next(std::string_view& line)
+{
+    const std::string_view rest = BeginRead();
+    if (rest.empty())
+        return false;
+    // Behind the longest piece there may be room for its line end, which counts as one character more: a line
+    // of just this length comes as itself and an empty piece.
+    const std::string_view window = rest.substr(0, kPieceLength + 2);
+    const size_t feed = window.find('\n');
+    line = feed == window.npos ? window : CutLineEnd(window, feed);
+    const bool lineEnds = feed != window.npos && line.size() < kPieceLength;
+    line = line.substr(0, kPieceLength);
+    m_kNow.m_bInsideLine = !lineEnds;
+    m_kNow.m_uiOffset += lineEnds ? feed + 1 : line.size();
+    return true;
+}
+
+bool CTextLines::NextRow(std::string_view& row)
+{
+    const std::string_view rest = BeginRead();
+    if (rest.empty())
+        return false;
+    const size_t feed = rest.find('\n');
+    row = feed == rest.npos ? rest : CutLineEnd(rest, feed);
+    m_kNow.m_bInsideLine = false;
+    m_kNow.m_uiOffset += feed == rest.npos ? rest.size() : feed + 1;
+    return true;
+}
+
+} // namespace gw
