@@ -25,8 +25,8 @@ inline constexpr float kEpsilon = 1.1920929e-07f;
 /// The arc cosine in radians; pi at or below -1, 0 at or above 1.
 double SafeAcos(float x);
 
-/// The arc sine in radians, with its ends the other way round on purpose: +pi / 2 at or below -1 and -pi / 2 at or
-/// above 1. Euler decompositions of whole quarter turns rest on it.
+/// The arc sine in radians, with its ends the other way round on purpose: +pi / 2 at or below -1 and -pi / 2
+/// at or above 1. Euler decompositions of whole quarter turns rest on it.
 double SafeAsin(float x);
 
 } // namespace gw

@@ -24,8 +24,8 @@ constexpr OrderRow kOrders[] = {
     {"YXZ", {2, 0, 1}},
 };
 
-// Codes 0 to 3 share one scheme, written as a table of matrix elements with signs. The middle angle is an arc sine;
-// `gimbal` is the angle that takes over when it stands at a quarter turn, and the third one is then 0.
+// Codes 0 to 3 share one scheme, written as a table of matrix elements with signs. The middle angle is an arc
+// sine; `gimbal` is the angle that takes over when it stands at a quarter turn, and the third one is then 0.
 struct Element
 {
     int index;
@@ -50,10 +50,10 @@ struct SineScheme
 };
 
 constexpr SineScheme kSchemes[] = {
-    {{6, 1}, 1, 0, {{1, 1}, {4, 1}}, 2, {{7, -1}, {8, 1}}, {{3, -1}, {0, 1}}},
-    {{2, -1}, 1, 2, {{3, -1}, {6, 1}}, 0, {{1, 1}, {0, 1}}, {{5, 1}, {8, 1}}},
-    {{3, -1}, 2, 0, {{2, -1}, {8, 1}}, 1, {{5, 1}, {4, 1}}, {{6, 1}, {0, 1}}},
-    {{1, 1}, 2, 1, {{5, 1}, {8, 1}}, 0, {{2, -1}, {0, 1}}, {{7, -1}, {4, 1}}},
+    {{6, 1},  1, 0, {{1, 1}, {4, 1}},  2, {{7, -1}, {8, 1}}, {{3, -1}, {0, 1}}},
+    {{2, -1}, 1, 2, {{3, -1}, {6, 1}}, 0, {{1, 1}, {0, 1}},  {{5, 1}, {8, 1}} },
+    {{3, -1}, 2, 0, {{2, -1}, {8, 1}}, 1, {{5, 1}, {4, 1}},  {{6, 1}, {0, 1}} },
+    {{1, 1},  2, 1, {{5, 1}, {8, 1}},  0, {{2, -1}, {0, 1}}, {{7, -1}, {4, 1}}},
 };
 
 void DecomposeBySine(const SineScheme& scheme, const float* m, float* angles)
@@ -93,7 +93,8 @@ void DecomposeZXY(const float* m, float* angles)
     angles[2] = static_cast<float>(z);
 }
 
-// "YXZ": element 7 carries the negative sine of X. An element of exactly 0 falls on the other side than above.
+// "YXZ": element 7 carries the negative sine of X. An element of exactly 0 falls on the other side than
+// above.
 void DecomposeYXZ(const float* m, float* angles)
 {
     if (1.0f - std::fabs(m[7]) < kEpsilon)
@@ -161,7 +162,8 @@ Vec3 Mat3ToEulerDegrees(const Mat3& matrix)
     if (cosY * m[0] < 0.0)
         z += kPi64;
     const double degrees = kInversePi64 * 180.0;
-    return {static_cast<float>(x * degrees), static_cast<float>(y * degrees), static_cast<float>(z * degrees)};
+    return {static_cast<float>(x * degrees), static_cast<float>(y * degrees),
+            static_cast<float>(z * degrees)};
 }
 
 void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z)

@@ -6,7 +6,8 @@
 
 namespace gw {
 
-/// Rotation orders. A string of the letters A, B, C means R_C · R_B · R_A: the last letter acts first on a row.
+/// Rotation orders. A string of the letters A, B, C means R_C · R_B · R_A: the last letter acts first on a
+/// row.
 enum class EEulerOrder : int
 {
     XYZ, ///< Rz · Ry · Rx
@@ -17,16 +18,16 @@ enum class EEulerOrder : int
     YXZ, ///< Rz · Rx · Ry
 };
 
-/// The matrix of three angles in degrees about X, Y and Z. The order is one of the six names in capitals; any other
-/// text gives the identity.
+/// The matrix of three angles in degrees about X, Y and Z. The order is one of the six names in capitals; any
+/// other text gives the identity.
 Mat3 EulerToMat3(std::string_view order, const Vec3& degrees);
 
-/// The angles in radians about X, Y and Z that give m in an order of 0 to 5 (EEulerOrder). A higher order writes
-/// nothing.
+/// The angles in radians about X, Y and Z that give m in an order of 0 to 5 (EEulerOrder). A higher order
+/// writes nothing.
 void Mat3ToEuler(const Mat3& m, int order, float& x, float& y, float& z);
 
-/// The angles in degrees about X, Y and Z of a "ZYX" matrix, with no gimbal branch; x and z may reach 270. A quotient
-/// of 0 by 0 counts as 0.
+/// The angles in degrees about X, Y and Z of a "ZYX" matrix, with no gimbal branch; x and z may reach 270. A
+/// quotient of 0 by 0 counts as 0.
 void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z);
 Vec3 Mat3ToEulerDegrees(const Mat3& m);
 

@@ -11,8 +11,7 @@ Mat3 operator*(const Mat3& a, const Mat3& b)
     {
         const float* r = &a.m[3 * row];
         for (int column = 0; column < 3; ++column)
-            out.m[3 * row + column] =
-                r[0] * b.m[column] + r[1] * b.m[3 + column] + r[2] * b.m[6 + column];
+            out.m[3 * row + column] = r[0] * b.m[column] + r[1] * b.m[3 + column] + r[2] * b.m[6 + column];
     }
     return out;
 }
@@ -31,11 +30,13 @@ Mat3 Mat3FromAxisAngle(const Vec3& axis, float angle)
     const double x = axis.x;
     const double y = axis.y;
     const double z = axis.z;
-    return {{static_cast<float>(x * x * t + c), static_cast<float>(x * y * t + z * s),
-             static_cast<float>(x * z * t - y * s), static_cast<float>(x * y * t - z * s),
-             static_cast<float>(y * y * t + c), static_cast<float>(y * z * t + x * s),
-             static_cast<float>(x * z * t + y * s), static_cast<float>(y * z * t - x * s),
-             static_cast<float>(z * z * t + c)}};
+    return {
+        {static_cast<float>(x * x * t + c), static_cast<float>(x * y * t + z * s),
+         static_cast<float>(x * z * t - y * s), static_cast<float>(x * y * t - z * s),
+         static_cast<float>(y * y * t + c), static_cast<float>(y * z * t + x * s),
+         static_cast<float>(x * z * t + y * s), static_cast<float>(y * z * t - x * s),
+         static_cast<float>(z * z * t + c)}
+    };
 }
 
 void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle)
@@ -45,7 +46,9 @@ void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle)
 
 Mat3 Mat3Transpose(const Mat3& a)
 {
-    return {{a.m[0], a.m[3], a.m[6], a.m[1], a.m[4], a.m[7], a.m[2], a.m[5], a.m[8]}};
+    return {
+        {a.m[0], a.m[3], a.m[6], a.m[1], a.m[4], a.m[7], a.m[2], a.m[5], a.m[8]}
+    };
 }
 
 Mat3 Mat3InverseOrIdentity(const Mat3& a)

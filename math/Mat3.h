@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A rotation or row basis: nine floats, row-major, element m[3r + c]. Rows multiply from the left; in A · B the
-/// transform A acts first. A positive angle about kVec3UnitZ takes (1, 0, 0) to (cos a, sin a, 0).
+/// A rotation or row basis: nine floats, row-major, element m[3r + c]. Rows multiply from the left; in A · B
+/// the transform A acts first. A positive angle about kVec3UnitZ takes (1, 0, 0) to (cos a, sin a, 0).
 struct Mat3
 {
     float m[9];
@@ -21,7 +21,9 @@ struct Mat3
     friend bool operator==(const Mat3&, const Mat3&) = default;
 };
 
-inline constexpr Mat3 kMat3Identity{{1, 0, 0, 0, 1, 0, 0, 0, 1}};
+inline constexpr Mat3 kMat3Identity{
+    {1, 0, 0, 0, 1, 0, 0, 0, 1}
+};
 
 /// out := a · b; out may be a or b. Answers out.
 Mat3& Mat3Multiply(const Mat3& a, const Mat3& b, Mat3& out);

@@ -15,9 +15,11 @@ void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const
 Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scale)
 {
     const float* r = rotation.m;
-    return {{r[0] * scale.x, r[1] * scale.x, r[2] * scale.x, 0.0f, r[3] * scale.y, r[4] * scale.y,
-             r[5] * scale.y, 0.0f, r[6] * scale.z, r[7] * scale.z, r[8] * scale.z, 0.0f, translation.x,
-             translation.y, translation.z, 1.0f}};
+    return {
+        {r[0] * scale.x, r[1] * scale.x, r[2] * scale.x, 0.0f, r[3] * scale.y, r[4] * scale.y, r[5] * scale.y,
+         0.0f, r[6] * scale.z, r[7] * scale.z, r[8] * scale.z, 0.0f, translation.x, translation.y,
+         translation.z, 1.0f}
+    };
 }
 
 Mat4 operator*(const Mat4& a, const Mat4& b)
@@ -27,8 +29,8 @@ Mat4 operator*(const Mat4& a, const Mat4& b)
     {
         const float* r = &a.m[4 * row];
         for (int column = 0; column < 4; ++column)
-            out.m[4 * row + column] = r[0] * b.m[column] + r[1] * b.m[4 + column] +
-                                      r[2] * b.m[8 + column] + r[3] * b.m[12 + column];
+            out.m[4 * row + column] = r[0] * b.m[column] + r[1] * b.m[4 + column] + r[2] * b.m[8 + column] +
+                                      r[3] * b.m[12 + column];
     }
     return out;
 }

@@ -22,11 +22,17 @@ struct Mat4
     friend bool operator==(const Mat4&, const Mat4&) = default;
 };
 
-inline constexpr Mat4 kMat4Identity{{1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1}};
+inline constexpr Mat4 kMat4Identity{
+    {1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1}
+};
 inline constexpr Mat4 kMat4Zero{};
 /// From the bones' frame to the limb solver's, and back: permutations with sign, inverse to each other.
-inline constexpr Mat4 AxisSwapForward{{0, -1, 0, 0, 0, 0, -1, 0, 1, 0, 0, 0, 0, 0, 0, 1}};
-inline constexpr Mat4 AxisSwapBack{{0, 0, 1, 0, -1, 0, 0, 0, 0, -1, 0, 0, 0, 0, 0, 1}};
+inline constexpr Mat4 AxisSwapForward{
+    {0, -1, 0, 0, 0, 0, -1, 0, 1, 0, 0, 0, 0, 0, 0, 1}
+};
+inline constexpr Mat4 AxisSwapBack{
+    {0, 0, 1, 0, -1, 0, 0, 0, 0, -1, 0, 0, 0, 0, 0, 1}
+};
 
 /// out := S · R · T. A null input stands for kMat3Identity, kVec3Zero, kVec3One.
 void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const Vec3* scale);
@@ -36,8 +42,8 @@ Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scal
 Mat4* Mat4Multiply(Mat4* out, const Mat4* a, const Mat4* b);
 Mat4 operator*(const Mat4& a, const Mat4& b);
 
-/// The general inverse of m into out. Null, and out left alone, where the determinant is 0 or its reciprocal is not
-/// finite in 32 bits. A non-null determinant is written before any test.
+/// The general inverse of m into out. Null, and out left alone, where the determinant is 0 or its reciprocal
+/// is not finite in 32 bits. A non-null determinant is written before any test.
 Mat4* Mat4Inverse(Mat4* out, float* determinant, const Mat4* m);
 /// The same with a result in every case: the identity where there is no inverse.
 Mat4 Mat4InverseOrIdentity(const Mat4& m);

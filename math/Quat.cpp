@@ -45,8 +45,10 @@ Mat3 QuatToMat3(const Quat& q)
     const float xw = q.x * q.w * 2.0f;
     const float yw = q.y * q.w * 2.0f;
     const float zw = q.z * q.w * 2.0f;
-    return {{1.0f - (zz + yy), xy + zw, xz - yw, xy - zw, 1.0f - (zz + xx), yz + xw, xz + yw, yz - xw,
-             1.0f - (yy + xx)}};
+    return {
+        {1.0f - (zz + yy), xy + zw, xz - yw, xy - zw, 1.0f - (zz + xx), yz + xw, xz + yw, yz - xw,
+         1.0f - (yy + xx)}
+    };
 }
 
 void QuatToMat3(const Quat& q, Mat3& out)

@@ -6,10 +6,13 @@
 #include "Vec3.h"
 
 #include <map>
-#include <memory>
 #include <string>
+#include <vector>
 
 namespace gw {
+
+class CKeyframeControl;
+class CPoseMatcher;
 
 /// Per-bone tuning of the target skeleton, from the share file.
 struct CBoneShares
@@ -19,9 +22,10 @@ struct CBoneShares
     float m_fType = 0.0f;   ///< decomposition: 0, 1 or any other, truncated
 };
 
-/// Turns the motion of a source skeleton into keyframes on the target skeleton. Told what to do by five tables keyed by
-/// target node; the nodes are looked at and not kept alive, so the trees must live as long as the tables are used.
-/// Row vectors; world position means the fourth row of a world matrix; lengths are in the skeletons' own units.
+/// Turns the motion of a source skeleton into keyframes on the target skeleton. Told what to do by five
+/// tables keyed by target node; the nodes are looked at and not kept alive, so the trees must live as long as
+/// the tables are used. Row vectors; world position means the fourth row of a world matrix; lengths are in
+/// the skeletons' own units.
 class CRetargeter
 {
 public:
@@ -51,21 +55,26 @@ public:
     bool IsFixed(const CNode* node, bool& fixed) const;
     bool Shares(const CNode* node, const CBoneShares*& shares) const;
 
-    /// The source's size as a factor for the target, and how far the feet rise over the ground: leg plus pelvis
-    /// heights compared, bent by `weight`. Both trees stand in rest pose. Outputs are left alone where LFoot, RFoot or
-    /// LThigh has no source.
+    /// The source's size as a factor for the target, and how far the feet rise over the ground: leg plus
+    /// pelvis heights compared, bent by `weight`. Both trees stand in rest pose. Outputs are left alone where
+    /// LFoot, RFoot or LThigh has no source.
     void MeasureBody(float& scale, float& footRise, float weight) const;
 
-    /// Poses the target frame by frame after the source and leaves a new track on every target node. `begin`, `last`,
-    /// `phase` and `frequency` go into the tracks; frames run from 0 through `last`. With `resetOrigin` the first frame
-    /// stands at `rootPosition`; with `useLegs` the limb solver plants the feet. Always true; see Record().
-    bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition, bool resetOrigin,
-                  bool useLegs);
+    /// Poses the target frame by frame after the source and leaves a new track on every target node. `begin`,
+    /// `last`, `phase` and `frequency` go into the tracks; frames run from 0 through `last`. With
+    /// `resetOrigin` the first frame stands at `rootPosition`; with `useLegs` the limb solver plants the
+    /// feet. Always true; see Record().
+    bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition,
+                  bool resetOrigin, bool useLegs);
 
     /// What the last run was not happy with.
     const CFailureRecord& Record() const { return m_kRecord; }
 
 private:
+    float MeasuredScale();
+    void PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks, float frequency,
+                    const Vec3& rootPosition, bool resetOrigin, bool useLegs);
+
     std::map<const CNode*, CBoneShares> m_kBoneShares;
     std::map<const CNode*, CNode*> m_kSourceOf;
     std::map<const CNode*, Vec3> m_kOffsetAngles;

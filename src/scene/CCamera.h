@@ -18,7 +18,8 @@ public:
     void ApplyRenderStates(RenderStateStack&) override {}
 };
 
-/// A camera: eye, look-at point and up vector in local space. A new one looks from the origin along -Z with Y up.
+/// A camera: eye, look-at point and up vector in local space. A new one looks from the origin along -Z with Y
+/// up.
 class CCamera : public CSpatial
 {
 public:

@@ -59,7 +59,8 @@ float CControl::MapTime(float time) const
     const float x = (s - m_fBeginTime) / range;
     const float period = std::floor(x);
     const float distance = (x - period) * range;
-    const bool backward = m_iCycleType != static_cast<uint32_t>(ECycleType::Loop) && std::fmod(period, 2.0f) != 0.0f;
+    const bool backward =
+        m_iCycleType != static_cast<uint32_t>(ECycleType::Loop) && std::fmod(period, 2.0f) != 0.0f;
     return backward ? m_fEndTime - distance : distance + m_fBeginTime;
 }
 

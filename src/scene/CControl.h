@@ -13,7 +13,8 @@ enum class ECycleType : uint32_t
     Reverse,
 };
 
-/// An object that changes another one over time. A caller's time becomes a key time by frequency, phase and cycle type.
+/// An object that changes another one over time. A caller's time becomes a key time by frequency, phase and
+/// cycle type.
 class CControl : public CObject
 {
 public:
@@ -40,8 +41,8 @@ public:
     /// The end of the chain that begins here.
     CControl* GetLast();
 
-    /// The key time of a caller's time: time x frequency + phase, brought into the range by the cycle type. A result
-    /// that is no number is the begin time.
+    /// The key time of a caller's time: time x frequency + phase, brought into the range by the cycle type. A
+    /// result that is no number is the begin time.
     float MapTime(float time) const;
 
     uint32_t m_iCycleType = 0; ///< ECycleType, as stored
@@ -56,7 +57,8 @@ private:
     Held<CControl> m_spkNext;
 };
 
-/// The class that links of a modifier chain must have. No concrete class derives from it, so no such object exists.
+/// The class that links of a modifier chain must have. No concrete class derives from it, so no such object
+/// exists.
 class CModifier : public CControl
 {
 public:

@@ -7,7 +7,8 @@
 
 namespace gw {
 
-/// A tagged object that a container carries without knowing what it means; a chain of them hangs on any object.
+/// A tagged object that a container carries without knowing what it means; a chain of them hangs on any
+/// object.
 class CCustomData : public CObject
 {
 public:
@@ -60,7 +61,8 @@ private:
     std::vector<std::byte> m_pbyData;
 };
 
-/// Five texts about a file's author. Its class record names CObject as base although it is a CCustomData in all else.
+/// Five texts about a file's author. Its class record names CObject as base although it is a CCustomData in
+/// all else.
 class CAuthorInfo : public CCustomData
 {
 public:

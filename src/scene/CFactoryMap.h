@@ -14,15 +14,18 @@ class COrrinStream;
 /// Makes an object and lets it read itself from the stream; null for a class that cannot be made.
 using CObjectFactory = CObject* (*)(COrrinStream& stream);
 
-/// From class name to factory: by it a container's class names become objects. One for the whole program, filled
-/// before main by the class tables of the rooms (SceneClasses.cpp and its kin).
+/// From class name to factory: by it a container's class names become objects. One for the whole program,
+/// filled before main by the class tables of the rooms (SceneClasses.cpp and its kin).
 class CFactoryMap
 {
 public:
     static CFactoryMap& Instance();
 
     /// An entry set twice keeps the last value.
-    void Set(std::string_view className, CObjectFactory factory) { m_kFactory[std::string(className)] = factory; }
+    void Set(std::string_view className, CObjectFactory factory)
+    {
+        m_kFactory[std::string(className)] = factory;
+    }
     /// The factory of a class, or null for a name that is not registered.
     CObjectFactory Find(std::string_view className) const;
     const std::map<std::string, CObjectFactory, std::less<>>& Entries() const { return m_kFactory; }

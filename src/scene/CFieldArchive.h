@@ -61,7 +61,8 @@ constexpr EFieldKind FieldKind()
     }
 }
 
-/// One reference of an object to another, whatever its class: what an archive reads, writes, resolves or follows.
+/// One reference of an object to another, whatever its class: what an archive reads, writes, resolves or
+/// follows.
 class CLinkSlot
 {
 public:
@@ -96,8 +97,9 @@ private:
     bool m_bCounted;
 };
 
-/// What runs a class's list of stored fields. Each scene class names its fields once, base first, in file order, in
-/// CObject::Fields; the archives below this one read, write, count, resolve, follow and describe them.
+/// What runs a class's list of stored fields. Each scene class names its fields once, base first, in file
+/// order, in CObject::Fields; the archives below this one read, write, count, resolve, follow and describe
+/// them.
 class CFieldArchive
 {
 public:
@@ -165,8 +167,8 @@ public:
         values.resize(Count(name, values.size(), sizeof(T)));
         Values(name, FieldKind<T>(), values.data(), values.size());
     }
-    /// A presence word and, where it is not 0, `count` plain values. On reading, a negative count or a zero word leaves
-    /// the block empty.
+    /// A presence word and, where it is not 0, `count` plain values. On reading, a negative count or a zero
+    /// word leaves the block empty.
     template <class T>
     void OptionalBlock(const char* name, std::vector<T>& values, int64_t count)
     {
@@ -183,10 +185,11 @@ public:
 
     /// A presence word of the file: any value but 0 means present. Answers what holds from here on.
     virtual bool Presence(const char* name, bool present) = 0;
-    /// A 32-bit count of elements of at least `leastBytes` each. Reading answers the file's, or 0 and a failure where
-    /// the bytes that remain cannot hold them; every other archive answers `count`.
+    /// A 32-bit count of elements of at least `leastBytes` each. Reading answers the file's, or 0 and a
+    /// failure where the bytes that remain cannot hold them; every other archive answers `count`.
     virtual size_t Count(const char* name, size_t count, size_t leastBytes) = 0;
-    /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is none.
+    /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is
+    /// none.
     virtual size_t Fitting(int64_t count, size_t elementBytes);
     /// Marks a read as damaged here; fields that follow read as zeros.
     virtual void Refuse() {}

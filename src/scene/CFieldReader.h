@@ -8,8 +8,8 @@
 
 namespace gw {
 
-/// Fills fields from the bytes of a container, and trusts none of them: what does not fit into the bytes that remain is
-/// damage, and from there on every field reads as zero.
+/// Fills fields from the bytes of a container, and trusts none of them: what does not fit into the bytes that
+/// remain is damage, and from there on every field reads as zero.
 class CFieldReader : public CFieldArchive
 {
 public:

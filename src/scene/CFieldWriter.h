@@ -11,7 +11,8 @@ namespace gw {
 /// Where written bytes go. The answer is false when they could not be taken.
 using CByteSink = std::function<bool(std::span<const std::byte>)>;
 
-/// Writes fields as a container holds them. Small values are gathered, large blocks go to the sink as they are.
+/// Writes fields as a container holds them. Small values are gathered, large blocks go to the sink as they
+/// are.
 class CFieldWriter : public CFieldArchive
 {
 public:

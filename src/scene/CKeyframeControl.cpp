@@ -82,7 +82,8 @@ bool CKeyframeControl::Update(float)
     return false;
 }
 
-CKeyframeControl::KeySpan CKeyframeControl::FindKeys(float time, const std::vector<float>& times, Cursor& cursor)
+CKeyframeControl::KeySpan CKeyframeControl::FindKeys(float time, const std::vector<float>& times,
+                                                     Cursor& cursor)
 {
     const uint32_t last = static_cast<uint32_t>(times.size()) - 1;
     if (!(time > times[0]))
@@ -125,7 +126,8 @@ void CKeyframeControl::GetPose(float time, Mat3& rotation, Vec3& position, Vec3&
     if (!m_kRotationTimes.empty())
         rotation = RotationKey(m_kRotationKeys, FindKeys(keyTime, m_kRotationTimes, m_uiRotationCursor));
     if (!m_kPositionTimes.empty())
-        position = LinearKey(m_kPositionKeys, FindKeys(keyTime, m_kPositionTimes, m_uiPositionCursor), kVec3Zero);
+        position =
+            LinearKey(m_kPositionKeys, FindKeys(keyTime, m_kPositionTimes, m_uiPositionCursor), kVec3Zero);
     if (!m_kScaleTimes.empty())
         scale = LinearKey(m_kScaleKeys, FindKeys(keyTime, m_kScaleTimes, m_uiScaleCursor), kVec3One);
 }
@@ -152,7 +154,8 @@ bool CKeyframeControl::UpdateTransform(float time)
     return true;
 }
 
-// Undoes the selected components of the pose that the parent's first track has at this time by its keys alone.
+// Undoes the selected components of the pose that the parent's first track has at this time by its keys
+// alone.
 void CKeyframeControl::CancelParent(CSpatial& target, float time)
 {
     CSpatial* parent = target.GetParent();

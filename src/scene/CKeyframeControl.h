@@ -11,9 +11,10 @@ namespace gw {
 
 class CSpatial;
 
-/// Rotation, position and scale tracks that rewrite the local matrix of their target, a spatial. Either m_kKeyTimes is
-/// filled and all three run on it, index for index, or each has its own time axis. Times are ascending; keeping them so
-/// and as long as the keys is the caller's duty, and where files did not, the last key there is stands in.
+/// Rotation, position and scale tracks that rewrite the local matrix of their target, a spatial. Either
+/// m_kKeyTimes is filled and all three run on it, index for index, or each has its own time axis. Times are
+/// ascending; keeping them so and as long as the keys is the caller's duty, and where files did not, the last
+/// key there is stands in.
 class CKeyframeControl : public CControl
 {
 public:
@@ -31,7 +32,8 @@ public:
     bool Update(float time) override;
     bool UpdateTransform(float time) override;
 
-    /// A search position on a time axis that stays where it was, so that sequential play costs one compare or two.
+    /// A search position on a time axis that stays where it was, so that sequential play costs one compare or
+    /// two.
     using Cursor = uint32_t;
     /// The keys around a key time: t lies at `fraction` between indices a and b. The axis must not be empty.
     struct KeySpan
@@ -45,7 +47,7 @@ public:
     /// The pose at a caller's time. Empty tracks give the identity, the origin and (1, 1, 1).
     void GetPose(float time, Mat3& rotation, Vec3& position, Vec3& scale);
 
-    bool m_bHasRestMatrix = false; ///< m_kRestMatrix is valid
+    bool m_bHasRestMatrix = false;      ///< m_kRestMatrix is valid
     Mat4 m_kRestMatrix = kMat4Identity; ///< written to the target while the control is inactive
     std::vector<Quat> m_kRotationKeys;
     std::vector<Vec3> m_kPositionKeys;
@@ -54,7 +56,8 @@ public:
     std::vector<float> m_kRotationTimes;
     std::vector<float> m_kPositionTimes;
     std::vector<float> m_kScaleTimes;
-    /// Which parts of the parent's key pose are undone here: bits 0 to 2 position x, y, z; 3 to 5 rotation; 6 to 8 scale.
+    /// Which parts of the parent's key pose are undone here: bits 0 to 2 position x, y, z; 3 to 5 rotation; 6
+    /// to 8 scale.
     uint32_t m_uiParentMask = 0;
 
 private:

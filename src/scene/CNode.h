@@ -28,7 +28,8 @@ public:
     void UpdateBound() override;
     void ApplyRenderStates(RenderStateStack& stack) override;
 
-    /// A copy of the tree's nodes alone: no meshes, no controls, child slots packed. The map keeps what is shared shared.
+    /// A copy of the tree's nodes alone: no meshes, no controls, child slots packed. The map keeps what is
+    /// shared shared.
     virtual CNode* CopySkeleton(CCloneMap& map);
     virtual CNode* CopySkeleton();
 

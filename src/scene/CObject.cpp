@@ -89,8 +89,8 @@ CObject::~CObject()
     m_spkControl = nullptr;
 }
 
-// The cursor stays on the id just taken: the next allocation finds it taken and steps over it, and an id that is freed
-// while the cursor stands on it is given out again at once.
+// The cursor stays on the id just taken: the next allocation finds it taken and steps over it, and an id that
+// is freed while the cursor stands on it is given out again at once.
 void CObject::TakeID()
 {
     while (g_abObjectIDInUse[g_uiNextObjectID])
@@ -125,8 +125,8 @@ void CObject::CloneHeld(CCloneMap& map, CObject& copy)
     copy.m_spkModifier = CloneOf(map, m_spkModifier.Get());
     copy.AttachCustomData(static_cast<CCustomData*>(CloneOf(map, m_spkCustomData.Get())));
 
-    // What comes behind the chains stands at the same place in both lists. A class whose copy starts with fewer slots
-    // (a node without children) fills in the rest itself.
+    // What comes behind the chains stands at the same place in both lists. A class whose copy starts with
+    // fewer slots (a node without children) fills in the rest itself.
     const std::vector<CLinkSlot> from = HeldSlots(*this);
     const std::vector<CLinkSlot> to = HeldSlots(copy);
     for (size_t i = kChainCount; i < to.size() && i < from.size(); ++i)
@@ -307,8 +307,8 @@ bool CObject::AttachCustomData(CCustomData* data)
         m_spkCustomData = data;
         return true;
     }
-    CCustomData* last = dynamic_cast<CCustomData*>(
-        m_spkControl ? static_cast<CObject*>(m_spkControl->GetLast()) : nullptr);
+    CCustomData* last =
+        dynamic_cast<CCustomData*>(m_spkControl ? static_cast<CObject*>(m_spkControl->GetLast()) : nullptr);
     if (!last)
         return false;
     last->SetNextData(data);

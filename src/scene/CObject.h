@@ -28,9 +28,9 @@ extern uint8_t g_abObjectIDInUse[kObjectIDCount]; ///< one byte per possible id,
 extern uint32_t g_uiNextObjectID;                 ///< where the search for a free id begins
 extern uint32_t g_uiObjectCount;                  ///< live objects
 
-/// The base of every scene thing: class record, reference count, id, name and three chains of attached objects.
-/// Born with count 0 and belonging to nobody; deletes itself when a release brings the count back to 0. Copying copies
-/// the class's own values under a fresh id, never the attachments.
+/// The base of every scene thing: class record, reference count, id, name and three chains of attached
+/// objects. Born with count 0 and belonging to nobody; deletes itself when a release brings the count back to
+/// 0. Copying copies the class's own values under a fresh id, never the attachments.
 class CObject
 {
 public:
@@ -66,11 +66,13 @@ public:
     virtual bool Update(float time);
     virtual bool UpdateRange(uint32_t range, float time);
 
-    /// The first object, this one included, that has the name and the class; null name or record match everything.
-    /// With `derived` a class derived from the record's fits too. Depth first, attachments before children.
+    /// The first object, this one included, that has the name and the class; null name or record match
+    /// everything. With `derived` a class derived from the record's fits too. Depth first, attachments before
+    /// children.
     virtual CObject* FindObject(const char* name, const CRTTI* record, bool derived);
     /// Appends all such objects.
-    virtual void FindObjects(std::vector<CObject*>& found, const char* name, const CRTTI* record, bool derived);
+    virtual void FindObjects(std::vector<CObject*>& found, const char* name, const CRTTI* record,
+                             bool derived);
     /// The objects that this one keeps alive, in search order, which is file order.
     std::vector<CObject*> HeldObjects();
     /// Lets references by name look up their objects under a root.
@@ -88,13 +90,13 @@ public:
     CControl* GetControl() const { return m_spkControl.Get(); }
     CObject* GetModifier() const { return m_spkModifier.Get(); }
     CCustomData* GetCustomData() const { return m_spkCustomData.Get(); }
-    /// Appends a control, with the chain behind it, to the control chain and targets it here. False for null and for a
-    /// control that has a target already.
+    /// Appends a control, with the chain behind it, to the control chain and targets it here. False for null
+    /// and for a control that has a target already.
     bool AttachControl(CControl* control);
     /// The same for the modifier chain, whose end is the first object that is no modifier.
     bool AttachModifier(CControl* modifier);
-    /// Makes a custom data object the head of its chain. With a head there already the end is looked for in the control
-    /// chain, as it has always been, and where that is no custom data nothing changes: false.
+    /// Makes a custom data object the head of its chain. With a head there already the end is looked for in
+    /// the control chain, as it has always been, and where that is no custom data nothing changes: false.
     bool AttachCustomData(CCustomData* data);
     /// Lets go of the control chain; its controls lose their target.
     void DetachControls();

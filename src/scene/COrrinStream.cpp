@@ -18,8 +18,8 @@ constexpr size_t kLeastFileBytes = 21;
 constexpr std::string_view kRootMarker = "_OrrinRoot";
 constexpr std::string_view kThumbnailTag = "_OrrinThumbnail";
 
-// "%1d.%2d" as sscanf reads it: blanks and a sign may stand before either number and count against no width but
-// the digits' own, so " 1. 2" has its place here too.
+// "%1d.%2d" as sscanf reads it: blanks and a sign may stand before either number and count against no width
+// but the digits' own, so " 1. 2" has its place here too.
 bool ScanDigits(const char*& text, int width, int& value)
 {
     while (*text == ' ' || (*text >= '\t' && *text <= '\r'))
@@ -48,12 +48,14 @@ CVersion ParseHeader(std::span<const std::byte> bytes)
         return {};
     const char* digits = text + kHeaderCompared;
     CVersion version;
-    if (!ScanDigits(digits, 1, version.m_iMajor) || *digits++ != '.' || !ScanDigits(digits, 2, version.m_iMinor))
+    if (!ScanDigits(digits, 1, version.m_iMajor) || *digits++ != '.' ||
+        !ScanDigits(digits, 2, version.m_iMinor))
         return {};
     return version;
 }
 
-// Resolves ids into the slots of an object: plain values are passed over, links take the record's ids in order.
+// Resolves ids into the slots of an object: plain values are passed over, links take the record's ids in
+// order.
 class CLinkResolver : public CFieldArchive
 {
 public:
@@ -87,7 +89,8 @@ void Unlink(CObject& object)
 }
 
 // Walks a graph by its counted references, without recursion, and tells what recursion would meet: rings, the
-// deepest nesting, and the number of places that a walk would visit when shared objects are visited once per place.
+// deepest nesting, and the number of places that a walk would visit when shared objects are visited once per
+// place.
 class CGraphCheck
 {
 public:
@@ -102,7 +105,8 @@ public:
         }
         for (const auto& [object, entry] : m_kEntries)
             visits = std::max(visits, entry.visits);
-        return visits > kVisitsPerObject * static_cast<double>(objects.size()) ? EFailure::TooLarge : EFailure::None;
+        return visits > kVisitsPerObject * static_cast<double>(objects.size()) ? EFailure::TooLarge
+                                                                               : EFailure::None;
     }
 
 private:
@@ -256,8 +260,8 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
     if (!sound && whole)
         DropGraph();
     m_kLinkTable.clear();
-    // Frees what no counted reference holds. Records go in file order; where links did not resolve to holders the
-    // objects go one by one and nothing recurses deeper than the graph that was checked.
+    // Frees what no counted reference holds. Records go in file order; where links did not resolve to holders
+    // the objects go one by one and nothing recurses deeper than the graph that was checked.
     m_kRecords.clear();
     return sound;
 }
@@ -390,7 +394,8 @@ uint64_t COrrinStream::BufferBytes()
 {
     CFieldCounter counter;
     m_kThumbnail.Fields(counter);
-    uint64_t bytes = 4 + kThumbnailTag.size() + counter.ByteCount() + m_kRoots.size() * (4 + kRootMarker.size());
+    uint64_t bytes =
+        4 + kThumbnailTag.size() + counter.ByteCount() + m_kRoots.size() * (4 + kRootMarker.size());
     for (const CObject* object : m_kSaveList)
         bytes += object->GetDiskUsed();
     return bytes;

@@ -22,21 +22,23 @@ class CFieldWriter;
 /// What an object left behind while a file is loading: the link ids that it read, in its own order.
 struct CLinkRecord
 {
-    uint32_t m_uiCursor = 0; ///< next id to resolve
+    uint32_t m_uiCursor = 0;  ///< next id to resolve
     Ref<CObject> m_spkObject; ///< kept alive until the links stand
     std::vector<uint32_t> m_kLinkID;
 };
 
-/// Nesting by counted references that a load accepts. Updates, searches and destructors recurse once per level.
+/// Nesting by counted references that a load accepts. Updates, searches and destructors recurse once per
+/// level.
 inline constexpr size_t kNestingLimit = 4000;
 /// A graph whose walks would visit more places than this for each object is refused.
 inline constexpr double kVisitsPerObject = 1e6;
 /// Containers are at most this large, read or written: offsets in them are signed 32-bit.
 inline constexpr uint64_t kContainerBytesLimit = 0x7fffffff;
 
-/// Reads and writes scene containers (.orn, .Kinetra): a flat sequence of object records that refer to each other by
-/// link ids. Reading and writing take two passes each: build and link, register and save. A stream keeps its roots; it
-/// can be used again. The bool answers are those of old; what really happened stands in Record().
+/// Reads and writes scene containers (.orn, .Kinetra): a flat sequence of object records that refer to each
+/// other by link ids. Reading and writing take two passes each: build and link, register and save. A stream
+/// keeps its roots; it can be used again. The bool answers are those of old; what really happened stands in
+/// Record().
 class COrrinStream
 {
 public:
@@ -45,11 +47,12 @@ public:
     COrrinStream(const COrrinStream&) = delete;
     COrrinStream& operator=(const COrrinStream&) = delete;
 
-    /// False, with roots and version as they were, for a file that cannot be read, is too short, or whose header or
-    /// version is not supported. Otherwise true whatever reading the objects did: see Record() and GetRoot.
+    /// False, with roots and version as they were, for a file that cannot be read, is too short, or whose
+    /// header or version is not supported. Otherwise true whatever reading the objects did: see Record() and
+    /// GetRoot.
     bool LoadFile(const std::string& path, bool thumbnailOnly);
-    /// The same from memory. Position 0 means a buffer without the header, in the newest version. True unless reading
-    /// ended early.
+    /// The same from memory. Position 0 means a buffer without the header, in the newest version. True unless
+    /// reading ended early.
     bool LoadBuffer(std::span<const std::byte> bytes, size_t position);
     bool LoadThumbnailOnly(std::span<const std::byte> bytes, size_t position);
     /// Replaces the file in one step. False when it cannot be written or the scene is too large.

@@ -35,7 +35,8 @@ void COrrinThumbnail::Fields(CFieldArchive& archive)
         // A size that is none, or a format that there is not: the bytes that follow cannot be told.
         if (stride <= 0 || m_iHeight <= 0)
             return archive.Refuse();
-        m_kPixels.resize(archive.Fitting(m_iHeight, static_cast<size_t>(stride)) * static_cast<size_t>(stride));
+        m_kPixels.resize(archive.Fitting(m_iHeight, static_cast<size_t>(stride)) *
+                         static_cast<size_t>(stride));
     }
     archive.Row("pixels", m_kPixels);
     archive.Unsigned("word A", m_uiWordA);

@@ -8,7 +8,8 @@ namespace gw {
 
 class CFieldArchive;
 
-/// The preview picture at the head of a container. The three words and the flag are carried along and read by nobody.
+/// The preview picture at the head of a container. The three words and the flag are carried along and read by
+/// nobody.
 struct COrrinThumbnail
 {
     /// The stored fields, in file order. Without pixels width, height and format are written as 0.

@@ -4,10 +4,11 @@ namespace gw {
 
 class CObject;
 
-/// The run-time record of a scene class. Two classes are the same exactly when their record addresses are equal.
+/// The run-time record of a scene class. Two classes are the same exactly when their record addresses are
+/// equal.
 struct CRTTI
 {
-    const char* m_pcName; ///< class name, as written into container files
+    const char* m_pcName;  ///< class name, as written into container files
     const CRTTI* m_pkBase; ///< record of the direct base class, null for CObject
 };
 

@@ -10,7 +10,8 @@ namespace gw {
 /// The number of render state types, and of the slots that a geometry has for them.
 inline constexpr size_t kRenderStateTypes = 7;
 
-/// One kind of drawing state. No concrete class derives from it; lists and slots of it exist for files and callers.
+/// One kind of drawing state. No concrete class derives from it; lists and slots of it exist for files and
+/// callers.
 class CRenderState : public CObject
 {
 public:
@@ -21,7 +22,8 @@ public:
     virtual size_t GetType() const = 0;
 };
 
-/// The states in force at one place of the render state walk, a stack for each type. Entry 0 is the type's default.
+/// The states in force at one place of the render state walk, a stack for each type. Entry 0 is the type's
+/// default.
 class RenderStateStack
 {
 public:

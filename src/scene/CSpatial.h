@@ -19,8 +19,8 @@ public:
     virtual void DrawTriMesh(CTriMesh& mesh) = 0;
 };
 
-/// An object with a place in space. World matrix and bound are valid after an UpdateScene and stale after any change of
-/// m_kMatrix until the next one; files do not store them.
+/// An object with a place in space. World matrix and bound are valid after an UpdateScene and stale after any
+/// change of m_kMatrix until the next one; files do not store them.
 class CSpatial : public CObject
 {
 public:
@@ -38,16 +38,17 @@ public:
     bool Rebind(const CCloneMap& map) override;
 
     virtual void Render(CRenderer&) {}
-    /// Runs the controls of the chain and computes the world matrix, unless two or more of them rewrote the transform:
-    /// then the world matrix keeps its old value.
+    /// Runs the controls of the chain and computes the world matrix, unless two or more of them rewrote the
+    /// transform: then the world matrix keeps its old value.
     virtual void UpdateTransform(float time);
     virtual void UpdateBound() = 0;
     virtual void ApplyRenderStates(RenderStateStack& stack) = 0;
 
-    /// Brings transforms, then controls, then bounds below here to a time; with `upward` also the ancestors' bounds.
+    /// Brings transforms, then controls, then bounds below here to a time; with `upward` also the ancestors'
+    /// bounds.
     void UpdateScene(float time, bool upward);
-    /// Pushes this object's states, or with null those of the whole parent chain on a new stack, applies what is in
-    /// force and pops again.
+    /// Pushes this object's states, or with null those of the whole parent chain on a new stack, applies what
+    /// is in force and pops again.
     void PushAndApply(RenderStateStack* stack);
     /// At most one state of each type: the one replaced is answered, or null.
     Ref<CRenderState> AttachRenderState(CRenderState& state);

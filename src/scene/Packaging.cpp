@@ -30,7 +30,11 @@ uint32_t FormatCode(const std::string& path)
     {
         std::string_view ending;
         uint32_t code;
-    } kFormats[] = {{".htr", 3}, {".cha", 1}, {".chb", 2}};
+    } kFormats[] = {
+        {".htr", 3},
+        {".cha", 1},
+        {".chb", 2}
+    };
     const std::string lower = LowerCase(path);
     for (const auto& format : kFormats)
     {

@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A plain pointer of one scene object to another that holds no count and becomes null when the other dies. Like Held
-/// it is not copied with its holder.
+/// A plain pointer of one scene object to another that holds no count and becomes null when the other dies.
+/// Like Held it is not copied with its holder.
 template <class T>
 class Watch
 {

@@ -1,0 +1,104 @@
+#include "CRetargeter.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+// The norms of the target family's proportions and what straying from them costs.
+constexpr float kLongNorm = 8.5f;
+constexpr float kLongBend = 0.0075f;
+constexpr float kShortNorm = 5.1f;
+constexpr float kShortBend = 0.007f;
+constexpr float kFootRiseLength = 10.0f;
+constexpr float kFootRiseFactor = 0.0032707655f;
+
+double SecondRowLength(const CSpatial* node)
+{
+    return node ? Vec3Length(node->m_kWorldMatrix.Row(1)) : 1.0;
+}
+
+// The links of a target leg: the first step up from the foot's parent is not counted.
+int TargetLinks(const CNode* foot)
+{
+    int links = 0;
+    for (const CNode* node = foot->GetParentNode(); node; node = node->GetParentNode())
+    {
+        if (node->NameView() == "LPelvis" || node->NameView() == "LowerTorso")
+            break;
+        ++links;
+    }
+    return links;
+}
+
+int SourceLinks(const CNode* foot, const CNode* thigh)
+{
+    int links = 1;
+    for (const CNode* node = foot->GetParentNode(); node && node != thigh; node = node->GetParentNode())
+        ++links;
+    return links;
+}
+
+// Two walkers that climb from the feet side by side; the left one measures.
+struct LegWalk
+{
+    const CNode* left;
+    const CNode* right;
+    double length = 0.0;
+
+    void Climb()
+    {
+        length += Vec3Length(left->m_kMatrix.Translation()) * SecondRowLength(left->GetParent());
+        if (left->GetParentNode())
+            left = left->GetParentNode();
+        if (right->GetParentNode())
+            right = right->GetParentNode();
+    }
+    double PelvisHeight(const CNode& hip) const
+    {
+        const Vec3 middle = (left->m_kWorldMatrix.Translation() + right->m_kWorldMatrix.Translation()) * 0.5f;
+        return Vec3Length(middle - hip.m_kWorldMatrix.Translation());
+    }
+};
+
+} // namespace
+
+void CRetargeter::MeasureBody(float& scale, float& footRise, float weight) const
+{
+    const CNode* torso = FindNode(m_pkTargetRoot, "LowerTorso");
+    const CNode* leftFoot = FindNode(m_pkTargetRoot, "LFoot");
+    const CNode* rightFoot = FindNode(m_pkTargetRoot, "RFoot");
+    const CNode* leftThigh = FindNode(m_pkTargetRoot, "LThigh");
+    const CNode* sourceHip = SourceOf(m_pkTargetRoot);
+    const CNode* sourceLFoot = SourceOf(leftFoot);
+    const CNode* sourceRFoot = SourceOf(rightFoot);
+    const CNode* sourceLThigh = SourceOf(leftThigh);
+    if (!torso || !sourceHip || !sourceLFoot || !sourceRFoot || !sourceLThigh)
+        return;
+
+    const int targetLinks = TargetLinks(leftFoot);
+    const int sourceLinks = SourceLinks(sourceLFoot, sourceLThigh);
+    LegWalk target{leftFoot, rightFoot};
+    LegWalk source{sourceLFoot, sourceRFoot};
+    for (int i = 0; i < std::max(targetLinks, sourceLinks); ++i)
+    {
+        if (i < targetLinks)
+            target.Climb();
+        if (i < sourceLinks)
+            source.Climb();
+    }
+    footRise =
+        static_cast<float>((target.length + kFootRiseLength * SecondRowLength(leftFoot)) * kFootRiseFactor);
+
+    const double targetPelvis = target.PelvisHeight(*torso);
+    const double sourcePelvis = source.PelvisHeight(*sourceHip);
+    const double proportion = target.length / targetPelvis;
+    const double bend = targetLinks > 2 ? (proportion - kLongNorm) * weight * kLongBend
+                                        : (proportion - kShortNorm) * weight * kShortBend;
+    scale =
+        static_cast<float>((targetPelvis + target.length) * (1.0 + bend) / (sourcePelvis + source.length));
+}
+
+} // namespace gw

@@ -1,0 +1,132 @@
+#include "CLegPlanter.h"
+
+#include "CKeyframeControl.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+// The solver's rotations come back into the bones' frame by its axis swap. That is what the "YXZ" angles x,
+// y, z of the rotation make of Ry(-z) · Rz(x) · Rx(-y), without the angles.
+Mat3 LimbToBone(const Mat3& m)
+{
+    const Vec3 rows[] = {-m.Row(1), -m.Row(2), m.Row(0)};
+    Mat3 out;
+    for (int row = 0; row < 3; ++row)
+        out.SetRow(row, {-rows[row].y, -rows[row].z, rows[row].x});
+    return out;
+}
+
+size_t Index(int bone)
+{
+    return static_cast<size_t>(bone);
+}
+
+} // namespace
+
+CLegPlanter::CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode& targetRoot)
+    : m_kMatcher(matcher), m_iTorso(matcher.IndexOf(FindNode(&targetRoot, "LowerTorso"))),
+      m_pkSourcePelvis(m_iTorso < 0 ? nullptr : retargeter.SourceOf(matcher.Bones()[Index(m_iTorso)].node)),
+      m_kSolver(2)
+{
+    if (!m_pkSourcePelvis)
+        return;
+    Plan(retargeter, targetRoot, "LThigh", "LFoot");
+    Plan(retargeter, targetRoot, "RThigh", "RFoot");
+}
+
+bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const char* thighName,
+                       const char* footName)
+{
+    const auto& bones = m_kMatcher.Bones();
+    const int thigh = m_kMatcher.IndexOf(FindNode(&targetRoot, thighName));
+    const int foot = m_kMatcher.IndexOf(FindNode(&targetRoot, footName));
+    const int calf = foot < 0 ? -1 : bones[Index(foot)].parent;
+    if (thigh < 0 || calf < 0 || bones[Index(calf)].parent < 0)
+        return false;
+    const auto offset = [&](int bone) {
+        const CNode* node = bones[Index(bone)].node;
+        return OffsetRotation(retargeter.OffsetAngles(node), retargeter.OffsetMatrix(node));
+    };
+    LegRecord leg{Index(thigh),
+                  Index(calf),
+                  Index(foot),
+                  retargeter.SourceOf(bones[Index(foot)].node),
+                  retargeter.SourceOf(bones[Index(bones[Index(calf)].parent)].node),
+                  offset(thigh),
+                  offset(calf),
+                  {}};
+    if (!leg.sourceFoot)
+        return false;
+    for (int bone = calf; bone >= 0; bone = bones[Index(bone)].parent)
+        leg.path.push_back(Index(bone));
+    std::ranges::reverse(leg.path);
+    m_kLegs.push_back(std::move(leg));
+    return true;
+}
+
+void CLegPlanter::Plant(size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks)
+{
+    for (size_t k = 0; k < m_kLegs.size(); ++k)
+        PlantLeg(k, frame, scale, tracks);
+}
+
+void CLegPlanter::UpdatePath(const LegRecord& leg)
+{
+    for (const size_t bone : leg.path)
+        m_kMatcher.UpdateWorld(bone);
+}
+
+// The length of a bone's translation under its parent's scale along the bone.
+double CLegPlanter::SegmentLength(size_t index) const
+{
+    const CPoseMatcher::Bone& bone = m_kMatcher.Bones()[index];
+    const Mat4& parentWorld = m_kMatcher.Bones()[Index(bone.parent)].world;
+    return Vec3Length(bone.translation) * Vec3Length(parentWorld.Row(1));
+}
+
+// A point before the source's thigh, toward which the knee bends.
+Vec3 CLegPlanter::HintPoint(const LegRecord& leg) const
+{
+    if (!leg.sourceThigh)
+        return kVec3Zero;
+    Vec3 point = leg.sourceThigh->m_kMatrix.Translation();
+    point.z += static_cast<float>(Vec3Length(point));
+    const CSpatial* parent = leg.sourceThigh->GetParent();
+    return parent ? TransformCoord(point, parent->m_kWorldMatrix) : point;
+}
+
+void CLegPlanter::PlantLeg(size_t k, size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks)
+{
+    const LegRecord& leg = m_kLegs[k];
+    UpdatePath(leg);
+    const auto& bones = m_kMatcher.Bones();
+    const CPoseMatcher::Bone& thigh = bones[leg.thigh];
+    m_kSolver.SetLimb(k, {0.0f, static_cast<float>(SegmentLength(leg.calf)), 0.0f},
+                      {0.0f, static_cast<float>(SegmentLength(leg.foot)), 0.0f}, kVec3UnitZ, kVec3UnitX);
+
+    const Vec3 sourcePelvis = m_pkSourcePelvis->m_kWorldMatrix.Translation();
+    const Vec3 fromHip = bones[Index(m_iTorso)].world.Translation() - thigh.world.Translation();
+    const auto toLimb = [&](const Vec3& point) {
+        return TransformCoord(fromHip + (point - sourcePelvis) * scale, AxisSwapForward);
+    };
+    Mat4 goal = kMat4Identity;
+    goal.SetTranslation(toLimb(leg.sourceFoot->m_kWorldMatrix.Translation()));
+    Vec3 hint = toLimb(HintPoint(leg));
+
+    CLegSolver::Pose pose;
+    if (!m_kSolver.Solve(k, hint, goal, pose))
+        return;
+    const Mat3 unparent = thigh.parent < 0
+                              ? kMat3Identity
+                              : Mat3InverseOrIdentity(NormalizedRows(bones[Index(thigh.parent)].world));
+    const Mat3 thighRotation = leg.thighOffset * (LimbToBone(pose.hip) * unparent);
+    const Mat3 calfRotation = leg.calfOffset * LimbToBone(pose.knee);
+    tracks[leg.thigh]->m_kRotationKeys[frame] = QuatFromMat3(thighRotation);
+    tracks[leg.calf]->m_kRotationKeys[frame] = QuatFromMat3(calfRotation);
+}
+
+} // namespace gw

@@ -1,0 +1,256 @@
+// The frame loop. What does not change from frame to frame is planned before it: which source nodes are
+// looked at (CSourceSampler), how the target's bones share their rotations (CPoseMatcher), which bones make a
+// leg (CLegPlanter), and the tracks at their full length. The loop touches arrays and allocates nothing.
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CGeometry.h"
+#include "CKeyframeControl.h"
+#include "CLegPlanter.h"
+#include "CMotionFile.h"
+#include "CPoseMatcher.h"
+#include "CRetargeter.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+#include <cmath>
+#include <unordered_set>
+
+namespace gw {
+
+namespace {
+
+constexpr float kBodyWeight = 0.45f;
+// Frame numbers are floats, and from here on the next one is the same.
+constexpr float kFrameLimit = 16777216.0f;
+// What the tracks of a result may take. A container can name any end time without a byte behind it.
+constexpr uint64_t kResultBytesLimit = uint64_t{1} << 31;
+constexpr uint64_t kKeyBytes = sizeof(float) + sizeof(Quat) + 2 * sizeof(Vec3);
+
+// Brings the source nodes that a conversion looks at, and those above them, to a time, each once. The rest of
+// the source (fingers, meshes, bounds) is left as it is until the end.
+class CSourceSampler
+{
+public:
+    CSourceSampler(CNode* root, const std::vector<CNode*>& wanted)
+    {
+        std::unordered_set<const CSpatial*> known;
+        for (CNode* node : wanted)
+            Add(*node, root, known);
+    }
+    void Sample(float time) const
+    {
+        for (CSpatial* spatial : m_kOrder)
+            spatial->CSpatial::UpdateTransform(time);
+    }
+
+private:
+    void Add(CNode& node, const CSpatial* root, std::unordered_set<const CSpatial*>& known)
+    {
+        std::vector<CSpatial*> path;
+        for (CSpatial* spatial = &node; spatial && known.insert(spatial).second;
+             spatial = spatial->GetParent())
+        {
+            path.push_back(spatial);
+            if (spatial == root)
+                break;
+        }
+        m_kOrder.insert(m_kOrder.end(), path.rbegin(), path.rend());
+        if (CBoneMesh* mesh = FindBoneMesh(node); mesh && known.insert(mesh).second)
+            m_kOrder.push_back(mesh);
+    }
+
+    std::vector<CSpatial*> m_kOrder; // parents first
+};
+
+void RestPose(CNode& root)
+{
+    SwitchControls(root, false);
+    root.UpdateScene(0.0f, true);
+}
+
+// Moves the root up or down so that the lowest point of the skeleton's meshes stands on y = 0.
+void GroundTarget(CNode& root, float time)
+{
+    root.UpdateScene(time, true);
+    float lowest = root.m_kBound.m_kCentre.y;
+    std::vector<CObject*> geometries;
+    root.FindObjects(geometries, nullptr, &CGeometry::ms_kRTTI, true);
+    for (CObject* geometry : geometries)
+    {
+        for (const Vec3& point : static_cast<CGeometry*>(geometry)->WorldXYZBuffer())
+            lowest = std::min(lowest, point.y);
+    }
+    Vec3 translation = root.m_kMatrix.Translation();
+    translation.y -= lowest;
+    root.m_kMatrix.SetTranslation(translation);
+}
+
+// World matrices alone, from the local ones as they stand: the new tracks must not speak yet.
+void UpdateWorlds(CNode& root)
+{
+    for (CNode* node : NodesOf(root))
+    {
+        const CSpatial* parent = node->GetParent();
+        node->m_kWorldMatrix = parent ? node->m_kMatrix * parent->m_kWorldMatrix : node->m_kMatrix;
+    }
+}
+
+uint64_t FrameCount(float last)
+{
+    if (!(last >= 0.0f))
+        return 0;
+    return static_cast<uint64_t>(std::min(std::floor(last), kFrameLimit - 1.0f)) + 1;
+}
+
+// A new track at its full length, with the bone's rest pose in every frame: what the loop does not change
+// stands.
+Ref<CKeyframeControl> MakeTrack(const CPoseMatcher::Bone& bone, size_t frameCount)
+{
+    Ref<CKeyframeControl> track = new CKeyframeControl;
+    track->m_kRestMatrix = bone.node->m_kMatrix;
+    track->m_bHasRestMatrix = true;
+    track->m_kKeyTimes.resize(frameCount);
+    for (size_t frame = 0; frame < frameCount; ++frame)
+        track->m_kKeyTimes[frame] = static_cast<float>(frame);
+    track->m_kScaleKeys.assign(frameCount, bone.scale);
+    track->m_kPositionKeys.assign(frameCount, bone.translation);
+    track->m_kRotationKeys.assign(frameCount, QuatFromMat3(bone.rotation));
+    return track;
+}
+
+// The root's way: the scaled motion of the source's hip, added up frame by frame. Sums are kept in 64 bits.
+class CRootPath
+{
+public:
+    CRootPath(const CNode* sourceHip, const CNode& targetRoot, float scale)
+        : m_pkHip(sourceHip), m_fScale(scale), m_kPreviousHip(HipPosition())
+    {
+        SetBase(targetRoot.m_kWorldMatrix.Translation());
+    }
+    /// The root's offset from the root position in the present frame.
+    Vec3 Advance(bool restart)
+    {
+        const Vec3 hip = HipPosition();
+        const Vec3 delta = hip - m_kPreviousHip;
+        m_kPreviousHip = hip;
+        if (restart)
+            SetBase(kVec3Zero);
+        else
+        {
+            m_afBase[0] += static_cast<double>(m_fScale) * delta.x;
+            m_afBase[1] += static_cast<double>(m_fScale) * delta.y;
+            m_afBase[2] += static_cast<double>(m_fScale) * delta.z;
+        }
+        return {static_cast<float>(m_afBase[0]), static_cast<float>(m_afBase[1]),
+                static_cast<float>(m_afBase[2])};
+    }
+
+private:
+    Vec3 HipPosition() const { return m_pkHip ? m_pkHip->m_kWorldMatrix.Translation() : kVec3Zero; }
+    void SetBase(const Vec3& base)
+    {
+        m_afBase[0] = base.x;
+        m_afBase[1] = base.y;
+        m_afBase[2] = base.z;
+    }
+
+    const CNode* m_pkHip;
+    float m_fScale;
+    Vec3 m_kPreviousHip;
+    double m_afBase[3];
+};
+
+void WriteKeys(const std::vector<CPoseMatcher::Bone>& bones, const std::vector<CKeyframeControl*>& tracks,
+               size_t frame)
+{
+    for (size_t bone = 0; bone < bones.size(); ++bone)
+    {
+        if (!bones[bone].posed)
+            continue;
+        tracks[bone]->m_kRotationKeys[frame] = QuatFromMat3(bones[bone].rotation);
+        tracks[bone]->m_kPositionKeys[frame] = bones[bone].translation;
+    }
+}
+
+} // namespace
+
+bool CRetargeter::Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition,
+                           bool resetOrigin, bool useLegs)
+{
+    m_kRecord.Clear();
+    if (!m_pkSourceRoot || !m_pkTargetRoot)
+        return true;
+    CNode& source = *m_pkSourceRoot;
+    CNode& target = *m_pkTargetRoot;
+    RestPose(target);
+    RestPose(source);
+    for (CNode* node : NodesOf(target))
+        node->DetachControls();
+
+    CPoseMatcher matcher(*this, target);
+    matcher.Match();
+    matcher.WriteNodes();
+    GroundTarget(target, 0.0f);
+    matcher.ReadTranslation(0);
+
+    uint64_t frameCount = FrameCount(last);
+    if (frameCount * kKeyBytes * matcher.Bones().size() > kResultBytesLimit)
+    {
+        m_kRecord.Fail(EFailure::TooLarge);
+        frameCount = 0;
+    }
+    std::vector<CKeyframeControl*> tracks;
+    for (const CPoseMatcher::Bone& bone : matcher.Bones())
+    {
+        const Ref<CKeyframeControl> track = MakeTrack(bone, frameCount);
+        track->m_fFrequency = frequency;
+        track->m_fBeginTime = begin;
+        track->m_fEndTime = last;
+        track->m_fPhase = phase;
+        bone.node->AttachControl(track.Get());
+        tracks.push_back(track.Get());
+    }
+    PoseFrames(matcher, tracks, frequency, rootPosition, resetOrigin, useLegs);
+
+    source.UpdateScene(0.0f, true);
+    target.UpdateScene(0.0f, true);
+    return true;
+}
+
+float CRetargeter::MeasuredScale()
+{
+    float scale = 1.0f;
+    float footRise = 0.0f;
+    MeasureBody(scale, footRise, kBodyWeight);
+    if (std::isfinite(scale) && scale > 0.0f)
+        return scale;
+    m_kRecord.Warn(EFailure::BadScale);
+    return 1.0f;
+}
+
+void CRetargeter::PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks,
+                             float frequency, const Vec3& rootPosition, bool resetOrigin, bool useLegs)
+{
+    UpdateWorlds(*m_pkTargetRoot);
+    const float scale = MeasuredScale();
+    const size_t frameCount = tracks.front()->m_kKeyTimes.size();
+    SwitchControls(*m_pkSourceRoot, true);
+
+    const CSourceSampler sampler(m_pkSourceRoot, matcher.SourceNodes());
+    CRootPath path(SourceOf(m_pkTargetRoot), *m_pkTargetRoot, scale);
+    CLegPlanter legs(*this, matcher, *m_pkTargetRoot);
+    auto& bones = matcher.Bones();
+    bones.front().posed = true; // the root moves even where nothing turns it
+    for (size_t frame = 0; frame < frameCount; ++frame)
+    {
+        sampler.Sample(static_cast<float>(frame) / frequency);
+        matcher.Match();
+        bones.front().translation = rootPosition + path.Advance(frame == 0 && resetOrigin);
+        WriteKeys(bones, tracks, frame);
+        if (useLegs)
+            legs.Plant(frame, scale, tracks);
+    }
+}
+
+} // namespace gw
