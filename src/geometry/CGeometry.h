@@ -27,8 +27,6 @@ public:
     bool Update(float time) override;
     /// Copies the model points and passes the call on; points stay in model space and normals as they are.
     bool UpdateRange(uint32_t range, float time) override;
-    bool Bind(CObject& root) override;
-    bool Rebind(const CCloneMap& map) override;
     void UpdateBound() override;
     /// Keeps what is in force in the slots of this geometry.
     void ApplyRenderStates(RenderStateStack& stack) override;
@@ -75,6 +73,7 @@ protected:
     CGeometry();
     CGeometry(const CGeometry& source);
     void CloneHeld(CCloneMap& map, CObject& copy) override;
+    void AppendBindOrder(std::vector<CObject*>& order) override;
     /// Sizes the index lists of the render vertices: those asked for get `count` entries, the others none.
     void SetVertexCount(size_t count, bool points, bool normals, bool colors);
 

@@ -30,8 +30,6 @@ public:
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;
-    bool Bind(CObject& root) override;
-    bool Rebind(const CCloneMap& map) override;
     void Render(CRenderer& renderer) override;
     /// Sums the triangles' normals, weighted by area, and normalises; a normal that only flat triangles touch
     /// is zero.
@@ -59,6 +57,9 @@ public:
 
     std::vector<Held<CTriMeshUVWMap>> m_apkUVWMap; ///< entries may be null
     std::vector<AttributeRange> m_kAttributeRanges;
+
+protected:
+    void AppendBindOrder(std::vector<CObject*>& order) override;
 
 private:
     std::vector<uint32_t> m_kTriangleMtlID;

@@ -8,8 +8,17 @@ const CRTTI CCameraTarget::ms_kRTTI{"CCameraTarget", &CSpatial::ms_kRTTI};
 const CRTTI CCamera::ms_kRTTI{"CCamera", &CSpatial::ms_kRTTI};
 
 CCamera::CCamera() = default;
-CCamera::CCamera(const CCamera& source) = default;
 CCamera::~CCamera() = default;
+
+// A bare copy looks at the same target; cloning replaces it by the target's copy.
+CCamera::CCamera(const CCamera& source)
+    : CSpatial(source), m_afParameter(source.m_afParameter), m_kEye(source.m_kEye), m_kUp(source.m_kUp),
+      m_kWorldEye(source.m_kWorldEye), m_kControlVector(source.m_kControlVector),
+      m_bCameraFlagA(source.m_bCameraFlagA), m_bCameraFlagB(source.m_bCameraFlagB),
+      m_kLookAt(source.m_kLookAt)
+{
+    m_spkCameraTarget = source.m_spkCameraTarget.Get();
+}
 
 CObject* CCamera::CreateClone() const
 {
@@ -40,18 +49,10 @@ bool CCamera::Update(float time)
     return true;
 }
 
-bool CCamera::Bind(CObject& root)
+void CCamera::AppendBindOrder(std::vector<CObject*>& order)
 {
-    if (m_spkCameraTarget)
-        m_spkCameraTarget->Bind(root);
-    return CSpatial::Bind(root);
-}
-
-bool CCamera::Rebind(const CCloneMap& map)
-{
-    if (m_spkCameraTarget)
-        m_spkCameraTarget->Rebind(map);
-    return CSpatial::Rebind(map);
+    order.push_back(m_spkCameraTarget.Get());
+    CSpatial::AppendBindOrder(order);
 }
 
 } // namespace gw

@@ -33,8 +33,6 @@ public:
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
-    bool Bind(CObject& root) override;
-    bool Rebind(const CCloneMap& map) override;
     void UpdateBound() override {}
     void ApplyRenderStates(RenderStateStack&) override {}
 
@@ -49,6 +47,9 @@ public:
     bool m_bCameraFlagA = true;        ///< stored and copied only
     bool m_bCameraFlagB = true;        ///< stored and copied only
     Vec3 m_kLookAt{0.0f, 0.0f, -1.0f};
+
+protected:
+    void AppendBindOrder(std::vector<CObject*>& order) override;
 
 private:
     Held<CCameraTarget> m_spkCameraTarget;

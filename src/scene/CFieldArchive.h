@@ -167,12 +167,24 @@ public:
         values.resize(Count(name, values.size(), sizeof(T)));
         Values(name, FieldKind<T>(), values.data(), values.size());
     }
-    /// A presence word and, where it is not 0, `count` plain values. On reading, a negative count or a zero
-    /// word leaves the block empty.
+    /// The same with a signed count, of which those below 0 are none.
+    template <class T>
+    void SignedBlock(const char* name, std::vector<T>& values)
+    {
+        int32_t count = static_cast<int32_t>(values.size());
+        Signed(name, count);
+        if (IsReading())
+            values.resize(Fitting(count, sizeof(T)));
+        Values(name, FieldKind<T>(), values.data(), values.size());
+    }
+    /// A presence word and, where it is not 0, `count` plain values. On reading, a zero word leaves the block
+    /// empty whatever the count, and a count below 0 with a block is damage: its length cannot be told.
     template <class T>
     void OptionalBlock(const char* name, std::vector<T>& values, int64_t count)
     {
         const bool present = Presence(name, !values.empty());
+        if (IsReading() && present && count < 0)
+            Refuse();
         if (IsReading())
             values.resize(present ? Fitting(count, sizeof(T)) : 0);
         if (present)

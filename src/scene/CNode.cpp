@@ -9,6 +9,12 @@ namespace gw {
 const CRTTI CNode::ms_kRTTI{"CNode", &CSpatial::ms_kRTTI};
 const CRTTI CBillboardNode::ms_kRTTI{"CBillboardNode", &CNode::ms_kRTTI};
 
+namespace {
+
+constexpr uint32_t kMostSpareSlots = 4096; // a file's word must not take memory at will
+
+} // namespace
+
 CNode::CNode(uint32_t growBy) : m_uiGrowBy(growBy) {}
 
 // The child array stays empty: cloning attaches the copies.
@@ -83,24 +89,11 @@ bool CNode::UpdateRange(uint32_t range, float time)
     return true;
 }
 
-bool CNode::Bind(CObject& root)
+void CNode::AppendBindOrder(std::vector<CObject*>& order)
 {
     for (const auto& child : m_kChild)
-    {
-        if (child)
-            child->Bind(root);
-    }
-    return CSpatial::Bind(root);
-}
-
-bool CNode::Rebind(const CCloneMap& map)
-{
-    for (const auto& child : m_kChild)
-    {
-        if (child)
-            child->Rebind(map);
-    }
-    return CSpatial::Rebind(map);
+        order.push_back(child.Get());
+    CSpatial::AppendBindOrder(order);
 }
 
 void CNode::Render(CRenderer& renderer)
@@ -218,7 +211,7 @@ Ref<CSpatial> CNode::SetChildAt(size_t index, CSpatial* child)
 {
     Ref<CSpatial> previous = GetChild(index);
     if (index >= m_kChild.size())
-        m_kChild.resize(std::max<size_t>(m_uiGrowBy, 1) + index);
+        m_kChild.resize(std::clamp(m_uiGrowBy, 1u, kMostSpareSlots) + index);
     if (previous)
         previous->SetParent(nullptr);
     if (child)

@@ -21,8 +21,6 @@ public:
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;
-    bool Bind(CObject& root) override;
-    bool Rebind(const CCloneMap& map) override;
     void Render(CRenderer& renderer) override;
     void UpdateTransform(float time) override;
     void UpdateBound() override;
@@ -56,6 +54,7 @@ public:
 
 protected:
     void CloneHeld(CCloneMap& map, CObject& copy) override;
+    void AppendBindOrder(std::vector<CObject*>& order) override;
 
 private:
     std::vector<Held<CSpatial>> m_kChild;

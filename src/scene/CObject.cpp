@@ -122,7 +122,10 @@ CObject* CObject::Clone(CCloneMap& map)
 void CObject::CloneHeld(CCloneMap& map, CObject& copy)
 {
     copy.AttachControl(static_cast<CControl*>(CloneOf(map, m_spkControl.Get())));
-    copy.m_spkModifier = CloneOf(map, m_spkModifier.Get());
+    // A file may have put any object at the head of the modifiers; only a control can be attached.
+    CObject* modifier = CloneOf(map, m_spkModifier.Get());
+    if (!copy.AttachModifier(RecordCast<CControl>(modifier)))
+        copy.m_spkModifier = modifier;
     copy.AttachCustomData(static_cast<CCustomData*>(CloneOf(map, m_spkCustomData.Get())));
 
     // What comes behind the chains stands at the same place in both lists. A class whose copy starts with
@@ -231,38 +234,32 @@ void CObject::FindObjects(std::vector<CObject*>& found, const char* name, const 
         held->FindObjects(found, name, record, derived);
 }
 
+void CObject::AppendBindOrder(std::vector<CObject*>& order)
+{
+    const std::vector<CObject*> held = HeldObjects();
+    order.insert(order.end(), held.begin(), held.end());
+}
+
 bool CObject::Bind(CObject& root)
 {
-    for (CObject* held : HeldObjects())
-        held->Bind(root);
+    std::vector<CObject*> order;
+    AppendBindOrder(order);
+    for (CObject* held : order)
+    {
+        if (held)
+            held->Bind(root);
+    }
     return true;
 }
 
 bool CObject::Rebind(const CCloneMap& map)
 {
-    for (CObject* held : HeldObjects())
-        held->Rebind(map);
-    return true;
-}
-
-bool CObject::BindChains(CObject& root)
-{
-    for (CObject* head : {static_cast<CObject*>(m_spkControl.Get()), m_spkModifier.Get(),
-                          static_cast<CObject*>(m_spkCustomData.Get())})
+    std::vector<CObject*> order;
+    AppendBindOrder(order);
+    for (CObject* held : order)
     {
-        if (head)
-            head->Bind(root);
-    }
-    return true;
-}
-
-bool CObject::RebindChains(const CCloneMap& map)
-{
-    for (CObject* head : {static_cast<CObject*>(m_spkControl.Get()), m_spkModifier.Get(),
-                          static_cast<CObject*>(m_spkCustomData.Get())})
-    {
-        if (head)
-            head->Rebind(map);
+        if (held)
+            held->Rebind(map);
     }
     return true;
 }

@@ -108,8 +108,9 @@ public:
     uint32_t m_uiChangeStamp = 0; ///< raised by a control each time it has rewritten this object; not copied
 
 protected:
-    bool BindChains(CObject& root);
-    bool RebindChains(const CCloneMap& map);
+    /// What Bind and Rebind pass the call to, in their order; entries may be null. Spatials name what they
+    /// add before what they inherit.
+    virtual void AppendBindOrder(std::vector<CObject*>& order);
     /// Clones what this object holds into its copy.
     virtual void CloneHeld(CCloneMap& map, CObject& copy);
 

@@ -1,6 +1,7 @@
 #include "CSpatial.h"
 
 #include "CControl.h"
+#include "CCustomData.h"
 #include "CFieldArchive.h"
 
 namespace gw {
@@ -53,24 +54,11 @@ bool CSpatial::UpdateRange(uint32_t range, float time)
     return true;
 }
 
-bool CSpatial::Bind(CObject& root)
+void CSpatial::AppendBindOrder(std::vector<CObject*>& order)
 {
     for (const auto& state : m_pkRenderStates)
-    {
-        if (state)
-            state->Bind(root);
-    }
-    return BindChains(root);
-}
-
-bool CSpatial::Rebind(const CCloneMap& map)
-{
-    for (const auto& state : m_pkRenderStates)
-    {
-        if (state)
-            state->Rebind(map);
-    }
-    return RebindChains(map);
+        order.push_back(state.Get());
+    order.insert(order.end(), {GetControl(), GetModifier(), GetCustomData()});
 }
 
 void CSpatial::UpdateTransform(float time)

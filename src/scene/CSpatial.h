@@ -34,8 +34,6 @@ public:
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;
-    bool Bind(CObject& root) override;
-    bool Rebind(const CCloneMap& map) override;
 
     virtual void Render(CRenderer&) {}
     /// Runs the controls of the chain and computes the world matrix, unless two or more of them rewrote the
@@ -64,6 +62,7 @@ public:
     bool m_bForceCull = false;           ///< the render walk skips this object with all below it
 
 protected:
+    void AppendBindOrder(std::vector<CObject*>& order) override;
     /// World matrix from the local one and the parent's.
     void UpdateWorldMatrix();
 

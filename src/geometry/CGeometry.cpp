@@ -1,0 +1,156 @@
+#include "CGeometry.h"
+
+#include "CFieldArchive.h"
+#include "CMaterialBase.h"
+
+namespace gw {
+
+const CRTTI CGeometry::ms_kRTTI{"CGeometry", &CSpatial::ms_kRTTI};
+
+CGeometry::CGeometry() = default;
+CGeometry::CGeometry(const CGeometry& source) = default;
+CGeometry::~CGeometry() = default;
+
+void CGeometry::Fields(CFieldArchive& archive)
+{
+    CSpatial::Fields(archive);
+    archive.SignedBlock("XYZBuffer", m_kXYZ);
+    archive.OptionalBlock("XYZMtl", m_kXYZMtl, static_cast<int64_t>(m_kXYZ.size()));
+    archive.Signed("normal count", m_iNormalCount);
+    archive.OptionalBlock("NormalBuffer", m_kNormal, m_iNormalCount);
+    archive.Signed("colour count", m_iColorCount);
+    archive.OptionalBlock("ColorBuffer", m_kColor, m_iColorCount);
+    archive.Signed("render vertex count", m_iVertexCount);
+    archive.OptionalBlock("VertexXYZIndex", m_kVertexXYZIndex, m_iVertexCount);
+    archive.OptionalBlock("VertexNormalIndex", m_kVertexNormalIndex, m_iVertexCount);
+    archive.OptionalBlock("VertexColorIndex", m_kVertexColorIndex, m_iVertexCount);
+    archive.Link("m_spkMaterialBase", m_spkMaterialBase);
+    archive.Bool("m_bBoneMesh", m_bBoneMesh);
+    if (!archive.IsReading())
+        return;
+    m_kWorldXYZ.resize(m_kXYZ.size());
+    m_kWorldNormal.resize(m_kNormal.size());
+}
+
+uint64_t CGeometry::GetMemoryUsed() const
+{
+    const size_t vectors =
+        m_kXYZ.size() + m_kWorldXYZ.size() + m_kNormal.size() + m_kWorldNormal.size() + m_kColor.size();
+    const size_t words = m_kXYZMtl.size() + m_kVertexXYZIndex.size() + m_kVertexNormalIndex.size() +
+                         m_kVertexColorIndex.size();
+    return CSpatial::GetMemoryUsed() + 88 + vectors * sizeof(Vec3) + words * sizeof(uint32_t);
+}
+
+void CGeometry::CloneHeld(CCloneMap& map, CObject& copy)
+{
+    CSpatial::CloneHeld(map, copy);
+    CGeometry& geometry = static_cast<CGeometry&>(copy);
+    for (size_t type = 0; type < kRenderStateTypes; ++type)
+    {
+        if (m_aspkRenderState[type])
+            geometry.m_aspkRenderState[type] =
+                static_cast<CRenderState*>(m_aspkRenderState[type]->Clone(map));
+    }
+}
+
+void CGeometry::AppendBindOrder(std::vector<CObject*>& order)
+{
+    for (const auto& state : m_aspkRenderState)
+        order.push_back(state.Get());
+    order.push_back(m_spkMaterialBase.Get());
+    CSpatial::AppendBindOrder(order);
+}
+
+bool CGeometry::Update(float time)
+{
+    m_bNormalsValid = false;
+    m_bWorldValid = false;
+    m_kWorldXYZ = m_kXYZ; // keeps its memory
+    CSpatial::Update(time);
+    if (!m_bWorldValid)
+        UpdateWorldPoints();
+    if (m_bAutoNormals && !m_bNormalsValid)
+        UpdateWorldNormals();
+    m_bNormalsValid = true;
+    return true;
+}
+
+bool CGeometry::UpdateRange(uint32_t range, float time)
+{
+    m_bWorldValid = false;
+    m_kWorldXYZ = m_kXYZ;
+    return CSpatial::UpdateRange(range, time);
+}
+
+void CGeometry::UpdateWorldPoints()
+{
+    for (Vec3& point : m_kWorldXYZ)
+        point = TransformCoord(point, m_kWorldMatrix);
+    m_bWorldValid = true;
+}
+
+void CGeometry::UpdateBound()
+{
+    m_kBound = BoundOfPoints(m_kWorldXYZ);
+}
+
+void CGeometry::ApplyRenderStates(RenderStateStack& stack)
+{
+    for (size_t type = 0; type < kRenderStateTypes; ++type)
+        m_aspkRenderState[type] = stack.Top(type);
+}
+
+bool CGeometry::SetPointCount(int32_t count)
+{
+    if (count < 1)
+        return false;
+    m_kXYZ.assign(static_cast<size_t>(count), kVec3Zero);
+    m_kWorldXYZ = m_kXYZ;
+    m_kXYZMtl.clear(); // one id for each point, or none
+    return true;
+}
+
+bool CGeometry::SetNormalCount(int32_t count)
+{
+    if (count < 1)
+        return false;
+    m_iNormalCount = count;
+    m_kNormal.assign(static_cast<size_t>(count), kVec3Zero);
+    m_kWorldNormal = m_kNormal;
+    return true;
+}
+
+bool CGeometry::SetColorCount(int32_t count)
+{
+    if (count < 1)
+        return false;
+    m_iColorCount = count;
+    m_kColor.assign(static_cast<size_t>(count), kVec3Zero);
+    return true;
+}
+
+bool CGeometry::CreateXYZMtl()
+{
+    m_kXYZMtl.assign(m_kXYZ.size(), 0);
+    return !m_kXYZMtl.empty();
+}
+
+void CGeometry::SetVertexCount(size_t count, bool points, bool normals, bool colors)
+{
+    m_iVertexCount = static_cast<int32_t>(count);
+    m_kVertexXYZIndex.resize(points ? count : 0);
+    m_kVertexNormalIndex.resize(normals ? count : 0);
+    m_kVertexColorIndex.resize(colors ? count : 0);
+}
+
+CMaterialBase* CGeometry::GetMaterial() const
+{
+    return m_spkMaterialBase.Get();
+}
+
+void CGeometry::SetMaterial(CMaterialBase* material)
+{
+    m_spkMaterialBase = material;
+}
+
+} // namespace gw
