@@ -78,6 +78,7 @@ public:
     void SelectOnly(int row);
     bool IsSelected(int row) const { return Has(row) && m_kSelected[Index(row)]; }
     int SelectedCount() const;
+    bool IsFixedSelected() const;
     /// The first selected row behind an index, or kNone; kNone begins at the start.
     int NextSelected(int after) const;
 

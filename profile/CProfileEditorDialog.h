@@ -3,16 +3,19 @@
 #include "CBoneMapProfile.h"
 #include "CBoneTree.h"
 #include "CMapRowTable.h"
+#include "CProfileFields.h"
 #include "CProfileOwner.h"
 
-#include <array>
 #include <string>
 #include <string_view>
 #include <vector>
 
 namespace gw {
 
-/// Controls of the profile editor, with the numbers that they have always had.
+class CProfileReader;
+struct CProfileLine;
+
+/// Controls of the profile editor beside its fields, with the numbers that they have always had.
 enum EProfileControl : int
 {
     kAddToMapButton = 5,
@@ -23,11 +26,6 @@ enum EProfileControl : int
     kSourceTree = 1002,
     kTargetTree = 1003,
     kMapRowList = 1008,
-    kNameField = 1038,
-    kOffsetXField = 1039, ///< the three offset fields are never shown and still read
-    kOffsetYField = 1040,
-    kOffsetZField = 1041,
-    kFrameRateField = 1042,
 };
 
 /// Which buttons of the profile editor take a click.
@@ -64,7 +62,6 @@ enum class EFieldCommit
 class CProfileEditorDialog : public CBoneMapProfile
 {
 public:
-    static constexpr size_t kNameLimit = 64; ///< characters of a display name
     static constexpr int kMappedSourceImage = 1;
     static constexpr int kMappedTargetImage = 4;
 
@@ -88,7 +85,7 @@ public:
     const CBoneTree& SourceTree() const { return m_kSourceTree; }
     const CBoneTree& TargetTree() const { return m_kTargetTree; }
     /// The text of the field with a control id; empty for other ids.
-    const std::string& FieldText(int id) const;
+    const std::string& FieldText(int id) const { return m_kFields.Text(id); }
     const CProfileButtons& Buttons() const { return m_kButtons; }
     bool IsDirty() const { return m_bDirty; }
     bool IsVisible() const { return m_bVisible; }
@@ -98,7 +95,7 @@ public:
     /// A button was clicked; nothing for a disabled one and for ids that are none.
     void ClickButton(int id);
     /// The text of a field changed while it has the focus.
-    void EditField(int id, std::string_view text);
+    void EditField(int id, std::string_view text) { m_kFields.Set(id, text); }
     /// A field lost the focus, by Enter and Escape too.
     void LeaveField();
     void SelectSourceItem(int item);
@@ -109,14 +106,14 @@ public:
     /// A click on a row, or on none with -1, after its selection.
     void ClickRow(int row);
     void DoubleClickRow(int row);
-    void Show();
+    void Show() { m_bVisible = true; }
     /// Hides the dialog; its state stays the current profile.
     void Close();
 
     // The operations behind.
     /// Reads a profile file. False when it cannot be opened, which changes nothing, and when a row's target
     /// is in the target scene and its source is not in the source scene. The counters may be null.
-    bool ReadProfile(const std::string& path, int* matched, int* total, EProfileRead mode);
+    bool ReadProfile(std::string path, int* matched, int* total, EProfileRead mode);
     /// Writes the profile to the file of its name, else to a new custom one. Whether a file was written.
     bool WriteProfile(EProfileWrite mode);
 
@@ -151,25 +148,19 @@ public:
     void SelectRowBones(int row);
 
 private:
-    static constexpr size_t kFieldCount = 5;
-
-    void SetField(int id, std::string text);
-    int ReadNumberField(int id, int low, int high);
+    bool ReadLines(CProfileReader& reader, int* matched, int* total, EProfileRead mode);
+    void LoadLine(const CProfileLine& line);
+    void MarkRowBones(std::string_view source, std::string_view target, bool mapped);
     void CommitNumbers(EFieldCommit mode);
     void CommitName(EFieldCommit mode);
-    bool IsNameInUse(std::string_view name) const;
     void SetDirty();
-    std::string PathToWrite() const;
-    bool WriteFile(const std::string& path);
-    void MarkRowBones(std::string_view source, std::string_view target, bool mapped);
-    bool IsButtonEnabled(int id) const;
 
     CProfileOwner& m_kOwner;
     const std::vector<std::string>* m_pkNamesInUse = nullptr;
     CMapRowTable m_kRows;
     CBoneTree m_kSourceTree{kMappedSourceImage};
     CBoneTree m_kTargetTree{kMappedTargetImage};
-    std::array<std::string, kFieldCount> m_kFieldText; // by id, from kNameField on
+    CProfileFields m_kFields;
     CProfileButtons m_kButtons;
     bool m_bDirty = false;
     bool m_bVisible = false;

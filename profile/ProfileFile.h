@@ -19,6 +19,14 @@ inline constexpr std::string_view kFixedSource = "[FIXED]";
 /// The most bytes that a profile may have; a full skeleton takes a fiftieth of this.
 inline constexpr size_t kProfileByteLimit = 256 * 1024;
 
+/// The platform's line end, which ends every line that is written.
+inline constexpr std::string_view kLineEnd =
+#ifdef _WIN32
+    "\r\n";
+#else
+    "\n";
+#endif
+
 /// The display name of a profile: the first line of its file, cut at the end. Empty when the file cannot be
 /// read.
 std::string ReadProfileName(const std::string& path);
@@ -74,11 +82,15 @@ private:
     void TakeTokens(std::string_view piece);
 
     std::string_view m_kRest;
+    std::string_view m_kRestOfLine;
     std::string m_kName;
     std::array<std::string, kTokenCount> m_kToken; // not cleared between lines
-    size_t m_uiLine = 1;
-    bool m_bInsideLine = false;
+    size_t m_uiLine = 0;
 };
+
+/// A decimal number cut to an integer toward zero; one that no integer can hold is the nearest end, none is
+/// 0.
+int CutToInteger(float value);
 
 /// The whole text of a profile file. The name is written as it is; the position is cut to integers toward
 /// zero.

@@ -1,0 +1,120 @@
+#include "MapLines.h"
+
+#include "CSafeFile.h"
+#include "Numbers.h"
+#include "ProfileFile.h"
+#include "Text.h"
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kArrow = "<--->";
+constexpr std::string_view kPosition = "position";
+constexpr std::string_view kFrameRate = "framerate";
+
+// Three numbers between commas or blanks; what is missing is 0.
+Vec3 ParseThree(std::string_view text)
+{
+    const auto next = [&text] { return static_cast<float>(ParseDouble(NextToken(text))); };
+    return {next(), next(), next()};
+}
+
+void ParseMapping(std::string_view text, CMapLine& line)
+{
+    line.source = NextWord(text);
+    NextWord(text); // the arrow
+    line.target = NextWord(text);
+    const size_t begin = text.find_first_not_of(kTokenDelimiters);
+    // A dot stands where no rotation was given yet.
+    line.hasRotation = begin != text.npos && text[begin] != '.';
+    if (line.hasRotation)
+        line.numbers = ParseThree(text);
+}
+
+std::string ThreeText(const Vec3& numbers)
+{
+    const auto cut = [](float value) { return std::to_string(CutToInteger(value)); };
+    return cut(numbers.x) + ',' + cut(numbers.y) + ',' + cut(numbers.z);
+}
+
+} // namespace
+
+CMapLine ParseMapLine(std::string_view text)
+{
+    CMapLine line;
+    line.text = text;
+    const std::string lower = LowerCase(text);
+    // What stands behind a keyword, wherever in the line it stands.
+    const auto behind = [&](std::string_view keyword) {
+        const size_t found = lower.find(keyword);
+        return found == lower.npos ? std::string_view() : text.substr(found + keyword.size());
+    };
+    if (lower.find(kArrow) != lower.npos)
+    {
+        line.kind = EMapLine::Mapping;
+        ParseMapping(text, line);
+    }
+    else if (lower.find('*') != lower.npos)
+    {
+        line.kind = EMapLine::Fixed;
+        NextWord(text);
+        line.target = NextWord(text);
+    }
+    else if (lower.find(kPosition) != lower.npos)
+    {
+        line.kind = EMapLine::Position;
+        line.numbers = ParseThree(behind(kPosition));
+    }
+    else if (lower.find(kFrameRate) != lower.npos)
+    {
+        line.kind = EMapLine::FrameRate;
+        std::string_view rest = behind(kFrameRate);
+        line.frameRate = ParseInt(NextToken(rest));
+    }
+    return line;
+}
+
+std::string PositionLine(const Vec3& position)
+{
+    return "Position " + ThreeText(position);
+}
+
+std::string FrameRateLine(int frameRate)
+{
+    return "FrameRate " + std::to_string(frameRate);
+}
+
+std::string MappingLine(std::string_view source, std::string_view target)
+{
+    return std::string(source).append(" <---> ").append(target).append(" .");
+}
+
+std::string MappingLine(std::string_view source, std::string_view target, const Vec3& degrees)
+{
+    return std::string(source).append(" <---> ").append(target).append(" ").append(ThreeText(degrees));
+}
+
+bool ReadMapLines(const std::string& path, std::vector<CMapLine>& lines)
+{
+    std::string text;
+    if (!ReadProfileText(path, text))
+        return false;
+    lines.clear();
+    std::string_view rest = SkipByteOrderMark(text);
+    std::string_view line;
+    while (NextLine(rest, line))
+        lines.push_back(ParseMapLine(line));
+    return true;
+}
+
+bool WriteMapLines(const std::string& path, std::span<const CMapLine> lines)
+{
+    std::string text;
+    for (const CMapLine& line : lines)
+        text.append(line.text).append(kLineEnd);
+    CSafeFile file;
+    return file.Open(path) && file.Write(text) && file.Commit();
+}
+
+} // namespace gw
