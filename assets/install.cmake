@@ -1,0 +1,12 @@
+# Copies the data files beside the executables. Stock profiles are told from a user's own by being read-only.
+separate_arguments(files UNIX_COMMAND "${ASSETS}")
+foreach(list_item IN LISTS ASSETS)
+  string(REPLACE "\"" "" source "${list_item}")
+  get_filename_component(name ${source} NAME)
+  file(REMOVE ${INSTALLED}/${name})
+  if(name MATCHES "\\.prf$")
+    file(COPY ${source} DESTINATION ${INSTALLED} FILE_PERMISSIONS OWNER_READ GROUP_READ WORLD_READ)
+  else()
+    file(COPY ${source} DESTINATION ${INSTALLED})
+  endif()
+endforeach()

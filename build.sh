@@ -1,0 +1,99 @@
+#!/usr/bin/env bash
+# The one door to building: installs what is missing on a Debian 12 machine, builds, runs.
+#
+#   ./build.sh build        builds the release into build/release/bin
+#   ./build.sh demo         builds and converts an example motion
+#   ./build.sh test         builds and runs all tests
+#   ./build.sh asan         the same tests under AddressSanitizer and UndefinedBehaviorSanitizer
+#   ./build.sh bench        runs the benchmarks: ratios within one run
+#   ./build.sh lint         checks formatting and runs the linter
+set -euo pipefail
+cd "$(dirname "$0")"
+
+# What a bare machine needs, by purpose; README.md says why each is there.
+packages_build=(g++ cmake ninja-build pkg-config ccache)
+packages_engine=(libcli11-dev nlohmann-json3-dev)
+packages_test=(libgtest-dev libgmock-dev locales python3)
+packages_bench=(libbenchmark-dev libassimp-dev python3 time)
+packages_lint=(clang-format clang-tidy)
+
+need() {
+  local missing=()
+  for package in "$@"; do
+    dpkg-query -W -f='${db:Status-Abbrev}' "$package" 2>/dev/null | grep -q '^ii' || missing+=("$package")
+  done
+  [ ${#missing[@]} -eq 0 ] && return
+  local sudo=""
+  [ "$(id -u)" -eq 0 ] || sudo=sudo
+  echo "Installing: ${missing[*]}"
+  $sudo apt-get -o DPkg::Lock::Timeout=600 update -qq
+  DEBIAN_FRONTEND=noninteractive $sudo apt-get -o DPkg::Lock::Timeout=600 install -y -qq --no-install-recommends \
+    "${missing[@]}" >/dev/null
+}
+
+# build PRESET: configures once and builds everything.
+build() {
+  [ -f "build/$1/build.ninja" ] || cmake --preset "$1" >/dev/null
+  cmake --build --preset "$1"
+}
+
+# run_tests PRESET: real motions lie beside the project on some machines; the tests use them where they are.
+run_tests() {
+  local data
+  data=$(realpath -m ../shared/data)
+  [ -d "$data" ] && export GAITWRIGHT_TEST_DATA="$data"
+  ctest --test-dir "build/$1" --output-on-failure --no-tests=error -j "$(nproc)"
+}
+
+prepare() {
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_test[@]}" libbenchmark-dev
+}
+
+demo() {
+  local bin=build/release/bin out
+  out=$(mktemp -d)
+  trap 'rm -rf "$out"' EXIT
+  echo "\$ gaitwright convert examples/walk.bvh -o walk.Kinetra"
+  "$bin/gaitwright" convert examples/walk.bvh -o "$out/walk.Kinetra"
+  echo "\$ gaitwright info walk.Kinetra"
+  "$bin/gaitwright" info "$out/walk.Kinetra"
+}
+
+case "${1:-}" in
+build)
+  prepare
+  build release
+  ;;
+demo)
+  prepare
+  build release
+  demo
+  ;;
+test)
+  prepare
+  build release
+  run_tests release
+  ;;
+asan)
+  prepare
+  build asan
+  export LSAN_OPTIONS="suppressions=$PWD/tests/lsan.supp:print_suppressions=0"
+  run_tests asan
+  ;;
+bench)
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_test[@]}" "${packages_bench[@]}"
+  build release
+  build/release/bin/gaitwright_bench
+  python3 bench/whole_process.py build/release/bin
+  ;;
+lint)
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
+  git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
+  [ -f build/dev/build.ninja ] || cmake --preset dev >/dev/null
+  git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
+  ;;
+*)
+  sed -n '4,9s/^# *//p' "$0"
+  exit 2
+  ;;
+esac
