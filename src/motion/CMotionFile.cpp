@@ -3,7 +3,10 @@
 #include "CKeyframeControl.h"
 #include "CLineWriter.h"
 #include "Paths.h"
+#include "TKBVHStream.h"
 
+#include <algorithm>
+#include <iterator>
 #include <memory>
 #include <new>
 #include <string_view>
@@ -20,9 +23,21 @@ struct StreamRow
     bool hasRestTree;
 };
 
-const StreamRow* FindStream(const std::string&)
+template <class T>
+std::unique_ptr<CMotionFile> Make()
 {
-    return nullptr;
+    return std::make_unique<T>();
+}
+
+constexpr StreamRow kStreams[] = {
+    {".bvh", Make<TKBVHStream>, false},
+};
+
+const StreamRow* FindStream(const std::string& path)
+{
+    const auto fits = [&](const StreamRow& row) { return HasExtension(path, row.extension); };
+    const auto found = std::ranges::find_if(kStreams, fits);
+    return found == std::end(kStreams) ? nullptr : found;
 }
 
 // The first control of a class in a tree, or null.

@@ -1,0 +1,136 @@
+// The writing half of TKBVHStream.
+
+#include "BoneMeshQueries.h"
+#include "CGeometry.h"
+#include "CLineWriter.h"
+#include "CMotionSampler.h"
+#include "Euler.h"
+#include "TKBVHFile.h"
+#include "TKBVHStream.h"
+
+#include <cmath>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+constexpr float kFrameLimit = 1 << 24; // frame numbers beyond are no whole floats
+constexpr std::string_view kIndent = "    ";
+constexpr std::string_view kKindNames[] = {"Global", "ROOT", "JOINT", "End"};
+
+/// A node and what the hierarchy says of it.
+struct Bone
+{
+    const CNode* node;
+    const TKBVHJoint* joint;
+};
+
+// Where the end of the bone's mesh's X axis stands, seen from the node.
+Vec3 EndOffset(CNode& node)
+{
+    const CObject* found = node.FindObject(node.GetName(), &CGeometry::ms_kRTTI, true);
+    const Mat4& world = found ? static_cast<const CGeometry*>(found)->m_kWorldMatrix : node.m_kWorldMatrix;
+    return TransformCoord(kVec3UnitX, world) - node.m_kWorldMatrix.Translation();
+}
+
+// Takes a tree in rest pose. Bones are collected in the order of the rows.
+void CollectBones(CNode& node, TKBVHJoint& joint, const Vec3& parentPosition, std::vector<Bone>& bones)
+{
+    const Vec3 position = node.m_kWorldMatrix.Translation();
+    joint.name = node.NameView();
+    joint.offset = position - parentPosition;
+    joint.channels = {5, 4, 3};
+    if (joint.kind == EJointKind::Root)
+        joint.channels.insert(joint.channels.begin(), {0, 1, 2});
+    bones.push_back({&node, &joint});
+    if (node.HasNoNodeChild())
+    {
+        TKBVHJoint& end = joint.AddChild(EJointKind::EndSite);
+        end.name = "Site";
+        end.offset = EndOffset(node);
+    }
+    for (size_t i = 0; i < node.GetChildCount(); ++i)
+    {
+        if (CNode* child = RecordCast<CNode>(node.ChildAt(i)))
+            CollectBones(*child, joint.AddChild(EJointKind::Joint), position, bones);
+    }
+}
+
+void WriteChannels(CLineWriter& out, const TKBVHJoint& joint)
+{
+    out.Text("CHANNELS ").Int(static_cast<int32_t>(joint.channels.size()));
+    for (const int channel : joint.channels)
+        out.Text(" ").Text(kChannelNames[channel]);
+    out.EndLine();
+}
+
+void WriteJoint(CLineWriter& out, const TKBVHJoint& joint, std::string& indent)
+{
+    out.Text(indent).Text(kKindNames[static_cast<int>(joint.kind)]).Text(" ").Text(joint.name).EndLine();
+    out.Text(indent).Line("{");
+    indent += kIndent;
+    out.Text(indent).Text("OFFSET ").Number(joint.offset.x).Text(" ");
+    out.Number(joint.offset.y).Text(" ").Number(joint.offset.z).EndLine();
+    if (!joint.channels.empty())
+        WriteChannels(out.Text(indent), joint);
+    for (const auto& child : joint.children)
+        WriteJoint(out, *child, indent);
+    indent.resize(indent.size() - kIndent.size());
+    out.Text(indent).Line("}");
+}
+
+void WriteRow(CLineWriter& out, const std::vector<Bone>& bones)
+{
+    for (const auto& [node, joint] : bones)
+    {
+        const Vec3 position = node->m_kMatrix.Translation() - joint->offset;
+        const Vec3 degrees = Mat3ToEulerDegrees(NormalizedRows(node->m_kMatrix));
+        const float values[] = {position.x, position.y, position.z, degrees.x, degrees.y, degrees.z};
+        for (const int channel : joint->channels)
+            out.Number(values[channel]).Text(" ");
+    }
+    out.EndLine();
+}
+
+} // namespace
+
+bool TKBVHStream::WriteFile(const std::string& path)
+{
+    m_kRecord.Clear();
+    if (!motionRoot)
+        return m_kRecord.Fail(EFailure::NoRoot);
+    const float lastFrame = GetLastFrame();
+    if (!(std::fabs(lastFrame) <= kFrameLimit))
+        return m_kRecord.Fail(EFailure::TooLarge);
+    const auto frameCount = static_cast<int>(lastFrame);
+    const float frequency = GetFrequency();
+
+    SwitchControls(*motionRoot, false);
+    motionRoot->UpdateScene(0.0f, true);
+    TKBVHJoint root;
+    root.kind = EJointKind::Root;
+    std::vector<Bone> bones;
+    CollectBones(*motionRoot, root, kVec3Zero, bones);
+    SwitchControls(*motionRoot, true);
+
+    CMotionSampler sampler(*motionRoot);
+    const bool written = WriteLines(path, [&](CLineWriter& out) {
+        std::string indent;
+        out.Line("HIERARCHY");
+        WriteJoint(out, root, indent);
+        out.Line("MOTION");
+        out.Text("Frames: ").Int(frameCount).EndLine();
+        out.Text("Frame Time: ").Number(frequency).EndLine();
+        for (int frame = 0; frame < frameCount; ++frame)
+        {
+            sampler.PoseTree(TimeOfFrame(frame, frequency));
+            WriteRow(out, bones);
+        }
+        return true;
+    });
+    motionRoot->UpdateScene(0.0f, true);
+    return written;
+}
+
+} // namespace gw

@@ -1,0 +1,172 @@
+#include "CBVHHierarchyReader.h"
+
+#include "COrrinStream.h"
+#include "CTextLines.h"
+#include "MotionNode.h"
+#include "Numbers.h"
+#include "TKBVHFile.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kNameLimit = 255;
+constexpr size_t kLongestQuote = 80; // of a word in the failure record
+
+// A finite number, or None and Unusual for what is none.
+float TakeNumber(std::string_view& rest, std::string_view& token, ENumber& kind)
+{
+    token = NextToken(rest);
+    const auto value = static_cast<float>(ParseDouble(token, kind));
+    if (!std::isfinite(value))
+        kind = ENumber::Unusual;
+    return value;
+}
+
+bool IsNoNumber(ENumber kind)
+{
+    return kind == ENumber::None || kind == ENumber::Unusual;
+}
+
+} // namespace
+
+bool CBVHHierarchyReader::Fail(EFailure reason, std::string_view name)
+{
+    return m_kRecord.Fail(reason, m_kLines.LineNumber(), std::string(name.substr(0, kLongestQuote)));
+}
+
+bool CBVHHierarchyReader::Read()
+{
+    m_kFile.root = std::make_unique<TKBVHJoint>();
+    m_kFile.root->name = "Global";
+    m_kFile.jointCount = 0;
+    for (std::string_view rest; m_kLines.Next(rest);)
+    {
+        const std::string_view keyword = NextToken(rest);
+        if (keyword == "MOTION")
+        {
+            m_kLines.StepBack();
+            return true;
+        }
+        if (keyword == "ROOT" && !ReadJoint(m_kFile.root->AddChild(EJointKind::Root), rest, 1))
+            return false;
+        if (keyword == "JOINT" && !ReadTopJoint(rest))
+            return false;
+    }
+    if (m_uiSwallowedMotion > 0)
+        return m_kRecord.Fail(EFailure::BadBrace, m_uiSwallowedMotion, "}");
+    return Fail(EFailure::MissingSection, "MOTION");
+}
+
+// A joint outside all blocks belongs to the first root.
+bool CBVHHierarchyReader::ReadTopJoint(std::string_view rest)
+{
+    TKBVHJoint* const root = m_kFile.FirstRoot();
+    if (!root)
+        return Fail(EFailure::NoRoot, NextToken(rest));
+    return ReadJoint(root->AddChild(EJointKind::Joint), rest, 2);
+}
+
+bool CBVHHierarchyReader::ReadJoint(TKBVHJoint& joint, std::string_view rest, size_t depth)
+{
+    if (!ReadName(joint, rest))
+        return false;
+    // A bone mesh nests one level deeper than its joint.
+    if (depth >= kNestingLimit)
+        return Fail(EFailure::TooDeep, joint.name);
+    if (++m_kFile.jointCount > kBoneLimit)
+        return Fail(EFailure::TooLarge, joint.name);
+    return ReadBody(joint, depth);
+}
+
+bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
+{
+    joint.name = NextToken(rest);
+    if (joint.name.size() > kNameLimit || (joint.name.empty() && joint.kind != EJointKind::EndSite))
+        return Fail(EFailure::BadName, joint.name);
+    if (!NextToken(rest).empty())
+        m_kRecord.Warn(EFailure::CutName, m_kLines.LineNumber(), joint.name);
+    return true;
+}
+
+// A file that ends inside a block is found out by the caller, who looks for "MOTION" then.
+bool CBVHHierarchyReader::ReadBody(TKBVHJoint& joint, size_t depth)
+{
+    bool open = false;
+    for (std::string_view rest; m_kLines.Next(rest);)
+    {
+        const std::string_view keyword = NextToken(rest);
+        if (keyword == "}")
+            return open || Fail(EFailure::BadBrace, keyword);
+        if (keyword == "{" && open)
+            return Fail(EFailure::BadBrace, keyword);
+        open = open || keyword == "{";
+        if (!ReadBodyLine(joint, keyword, rest, depth))
+            return false;
+    }
+    return true;
+}
+
+bool CBVHHierarchyReader::ReadBodyLine(TKBVHJoint& joint, std::string_view keyword, std::string_view rest,
+                                       size_t depth)
+{
+    if (keyword == "JOINT")
+        return ReadJoint(joint.AddChild(EJointKind::Joint), rest, depth + 1);
+    if (keyword == "End")
+        return ReadJoint(joint.AddChild(EJointKind::EndSite), rest, depth + 1);
+    if (keyword == "OFFSET")
+        return ReadOffset(joint, rest);
+    if (keyword == "CHANNELS")
+        return ReadChannels(joint, rest);
+    if (keyword == "MOTION" && m_uiSwallowedMotion == 0)
+        m_uiSwallowedMotion = m_kLines.LineNumber();
+    return true;
+}
+
+bool CBVHHierarchyReader::ReadOffset(TKBVHJoint& joint, std::string_view rest)
+{
+    for (float* const component : {&joint.offset.x, &joint.offset.y, &joint.offset.z})
+    {
+        std::string_view token;
+        ENumber kind;
+        *component = TakeNumber(rest, token, kind);
+        if (token.empty())
+            return Fail(EFailure::MissingTokens, joint.name);
+        if (IsNoNumber(kind))
+            return Fail(EFailure::BadNumber, token);
+        if (kind == ENumber::Stuck)
+            m_kRecord.Warn(EFailure::StuckNumber, m_kLines.LineNumber(),
+                           std::string(token.substr(0, kLongestQuote)));
+    }
+    return true;
+}
+
+bool CBVHHierarchyReader::ReadChannels(TKBVHJoint& joint, std::string_view rest)
+{
+    const std::string_view number = NextToken(rest);
+    int32_t count = 0;
+    if (number.empty())
+        return Fail(EFailure::MissingTokens, joint.name);
+    if (!ScanInt(number, count))
+        return Fail(EFailure::BadNumber, number);
+    for (; count > 0; --count)
+    {
+        const std::string_view channel = NextToken(rest);
+        if (channel.empty())
+            return Fail(EFailure::MissingTokens, joint.name);
+        const auto known = std::ranges::find(kChannelNames, channel);
+        if (known != std::end(kChannelNames))
+            joint.channels.push_back(static_cast<int>(known - std::begin(kChannelNames)));
+        else
+            m_kRecord.Warn(EFailure::UnknownChannel, m_kLines.LineNumber(),
+                           std::string(channel.substr(0, kLongestQuote)));
+    }
+    return true;
+}
+
+} // namespace gw

@@ -1,0 +1,267 @@
+// Nearly all of a BVH file is its motion rows, so this is where loading takes its time. A row is read by one
+// cursor into a small array of numbers, which then become a key for each joint at once: no text is copied, no
+// value is kept, and the keys are where the track will have them. Key arrays are reserved once, but never
+// beyond what the file's bytes can fill: a count in a file is a claim.
+
+#include "CBVHRowReader.h"
+
+#include "Angles.h"
+#include "AxisRotation.h"
+#include "CTextLines.h"
+#include "Numbers.h"
+#include "TKBVHFile.h"
+#include "Text.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kBytesPerValue = 2;                // a digit and a separator
+constexpr size_t kForgetInterval = size_t{8} << 20; // pages are given back in pieces of this size
+constexpr size_t kLongestQuote = 80;                // of a token in the failure record
+constexpr int kProbeRows = 8;                       // rows that may tell that positions repeat the offsets
+constexpr double kRepeatTolerance = 0.01;           // of an offset's length
+
+bool IsSeparator(char c)
+{
+    return c == ' ' || c == '\t' || c == ',';
+}
+
+const char* TokenEnd(const char* text, const char* end)
+{
+    return std::find_if(text, end, IsSeparator);
+}
+
+const char* SkipSeparators(const char* text, const char* end)
+{
+    while (text != end && IsSeparator(*text))
+        ++text;
+    return text;
+}
+
+std::string Quote(std::string_view token)
+{
+    return std::string(token.substr(0, kLongestQuote));
+}
+
+void AppendKey(TKBVHJoint& joint, const float* values)
+{
+    Mat3 rotation = kMat3Identity;
+    Vec3 position = joint.offset;
+    float* const components[] = {&position.x, &position.y, &position.z};
+    for (const int channel : joint.channels)
+    {
+        const float value = *values++;
+        if (channel < kFirstRotation)
+            *components[channel] += value;
+        else if (channel < kFirstScale)
+            RotateRows(rotation, channel - kFirstRotation, value * kDegreesToRadians);
+    }
+    joint.rotationKeys.push_back(QuatFromMat3(rotation));
+    joint.positionKeys.push_back(position);
+}
+
+// Whether the position channels of a joint say its offset over again. False for one without an offset.
+bool RepeatsOffset(const TKBVHJoint& joint, const float* values)
+{
+    Vec3 position = kVec3Zero;
+    float* const components[] = {&position.x, &position.y, &position.z};
+    for (size_t i = 0; i < joint.channels.size(); ++i)
+    {
+        if (joint.channels[i] < kFirstRotation)
+            *components[joint.channels[i]] = values[i];
+    }
+    return Vec3Length(position - joint.offset) <= kRepeatTolerance * Vec3Length(joint.offset);
+}
+
+bool HasPositions(const TKBVHJoint& joint)
+{
+    return std::ranges::count_if(joint.channels, [](int channel) { return channel < kFirstRotation; }) >= 3;
+}
+
+} // namespace
+
+CBVHRowReader::CBVHRowReader(TKBVHJoint& root, CFailureRecord& record)
+    : m_kRecord(record), m_uiRootValues(std::max<size_t>(root.channels.size(), 1)), m_iProbes(kProbeRows)
+{
+    // The root takes a value also where it has no channels.
+    if (root.channels.empty())
+        m_kRow.resize(1);
+    AddColumns(root);
+}
+
+void CBVHRowReader::AddColumns(TKBVHJoint& joint)
+{
+    if (!joint.channels.empty())
+        m_kColumns.push_back({&joint, m_kRow.size(), {}});
+    m_kRow.resize(m_kRow.size() + joint.channels.size());
+    for (const auto& child : joint.children)
+        AddColumns(*child);
+}
+
+bool CBVHRowReader::RowsFit(size_t frameCount, size_t byteCount) const
+{
+    return frameCount <= (byteCount + 1) / (kBytesPerValue * m_uiRootValues);
+}
+
+void CBVHRowReader::ReserveKeys(size_t frameCount, size_t byteCount)
+{
+    if (frameCount > (byteCount + 1) / (kBytesPerValue * m_kRow.size()))
+        return; // rows will be short, and the arrays grow with what there is
+    for (const Column& column : m_kColumns)
+    {
+        column.joint->rotationKeys.reserve(column.joint->rotationKeys.size() + frameCount);
+        column.joint->positionKeys.reserve(column.joint->positionKeys.size() + frameCount);
+    }
+}
+
+bool CBVHRowReader::ReadRows(CTextLines& lines, size_t frameCount)
+{
+    size_t forgetAt = lines.BytesLeft();
+    ReserveKeys(frameCount, lines.BytesLeft());
+    std::string_view row;
+    for (size_t frame = 0; frame < frameCount; ++frame)
+    {
+        if (!lines.NextRow(row))
+            return false;
+        m_uiLine = lines.LineNumber();
+        if (!ReadRow(row))
+            return false;
+        if (forgetAt - lines.BytesLeft() < kForgetInterval)
+            continue;
+        forgetAt = lines.BytesLeft();
+        lines.ForgetRead();
+    }
+    FillLastKeys();
+    return true;
+}
+
+bool CBVHRowReader::ReadRow(std::string_view row)
+{
+    if (!ReadValues(row))
+        return false;
+    if (m_uiValues < m_kRow.size() && !CheckLength(m_uiValues == 0))
+        return false;
+    if (m_iProbes > 0)
+        LookForDoubledOffsets();
+    AppendKeys();
+    return true;
+}
+
+bool CBVHRowReader::ReadValues(std::string_view row)
+{
+    const char* const end = row.data() + row.size();
+    const char* text = row.data();
+    for (m_uiValues = 0; m_uiValues < m_kRow.size(); ++m_uiValues)
+    {
+        text = SkipSeparators(text, end);
+        if (text == end)
+            break;
+        ENumber kind;
+        const char* next;
+        m_kRow[m_uiValues] = ReadFloat(text, end, next, kind);
+        if (kind != ENumber::Whole)
+        {
+            next = TokenEnd(text, end);
+            if (!JudgeToken({text, next}, m_uiValues))
+                return false;
+        }
+        text = next;
+    }
+    return true;
+}
+
+// A token that is no plain number: read as far as it goes, or refused. Root values are read like atof, which
+// takes what sscanf gives up on.
+bool CBVHRowReader::JudgeToken(std::string_view token, size_t index)
+{
+    ENumber kind;
+    float& value = m_kRow[index];
+    value = 0.0f;
+    if (index < m_uiRootValues)
+        value = static_cast<float>(ParseDouble(token, kind));
+    else
+        ScanFloat(token, value, kind);
+    if (kind == ENumber::None || kind == ENumber::Unusual || !std::isfinite(value))
+        return m_kRecord.Fail(EFailure::BadNumber, m_uiLine, Quote(token));
+    if (kind == ENumber::Stuck)
+        m_kRecord.Warn(EFailure::StuckNumber, m_uiLine, Quote(token));
+    return true;
+}
+
+bool CBVHRowReader::CheckLength(bool blank)
+{
+    if (blank)
+        return m_kRecord.Fail(EFailure::BlankLine, m_uiLine);
+    const auto lacks = [this](const Column& c) { return c.first + c.joint->channels.size() > m_uiValues; };
+    const auto column = std::ranges::find_if(m_kColumns, lacks);
+    const std::string name = column == m_kColumns.end() ? std::string() : column->joint->name;
+    if (m_uiValues < m_uiRootValues)
+        return m_kRecord.Fail(EFailure::MissingTokens, m_uiLine, name);
+    m_kRecord.Warn(EFailure::ShortRow, m_uiLine, name);
+    return true;
+}
+
+void CBVHRowReader::AppendKeys()
+{
+    for (Column& column : m_kColumns)
+    {
+        if (column.pending.empty() && column.first + column.joint->channels.size() <= m_uiValues)
+            AppendKey(*column.joint, &m_kRow[column.first]);
+        else
+            AppendLate(column);
+    }
+}
+
+// After a short row a joint's values are out of step with the rows: a key is made whenever enough have come.
+void CBVHRowReader::AppendLate(Column& column)
+{
+    const size_t count = column.joint->channels.size();
+    const size_t first = std::min(column.first, m_uiValues);
+    const size_t last = std::min(column.first + count, m_uiValues);
+    const auto row = m_kRow.begin();
+    column.pending.insert(column.pending.end(), row + static_cast<ptrdiff_t>(first),
+                          row + static_cast<ptrdiff_t>(last));
+    if (column.pending.size() < count)
+        return;
+    AppendKey(*column.joint, column.pending.data());
+    column.pending.erase(column.pending.begin(), column.pending.begin() + static_cast<ptrdiff_t>(count));
+}
+
+// Values that do not fill a key make one all the same; those that are missing count as 0.
+void CBVHRowReader::FillLastKeys()
+{
+    for (Column& column : m_kColumns)
+    {
+        if (column.pending.empty())
+            continue;
+        column.pending.resize(column.joint->channels.size());
+        AppendKey(*column.joint, column.pending.data());
+        column.pending.clear();
+    }
+}
+
+void CBVHRowReader::LookForDoubledOffsets()
+{
+    --m_iProbes;
+    size_t candidates = 0;
+    std::vector<const TKBVHJoint*> repeating;
+    for (size_t i = 1; i < m_kColumns.size(); ++i)
+    {
+        const auto& [joint, first, pending] = m_kColumns[i];
+        if (!HasPositions(*joint) || joint->offset == kVec3Zero ||
+            first + joint->channels.size() > m_uiValues)
+            continue;
+        ++candidates;
+        if (RepeatsOffset(*joint, &m_kRow[first]))
+            repeating.push_back(joint);
+    }
+    if (repeating.empty() || repeating.size() * 2 < candidates)
+        return;
+    m_kRecord.Warn(EFailure::DoubledOffsets, m_uiLine, repeating[0]->name);
+    m_iProbes = 0;
+}
+
+} // namespace gw

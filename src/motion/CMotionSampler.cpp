@@ -1,0 +1,77 @@
+#include "CMotionSampler.h"
+
+#include "CKeyframeControl.h"
+#include "CNode.h"
+#include "Skeleton.h"
+
+#include <cmath>
+#include <limits>
+
+namespace gw {
+
+namespace {
+
+// Whether a control poses a node by its own keys and nothing else.
+bool StandsAlone(const CControl& control, const CNode& node)
+{
+    const auto* track = dynamic_cast<const CKeyframeControl*>(&control);
+    return track && track->m_uiParentMask == 0 && track->GetTarget() == &node && !track->GetNext();
+}
+
+} // namespace
+
+CMotionSampler::CMotionSampler(CNode& root)
+    : m_kRoot(root), m_kNodes(NodesOf(root)), m_kTracks(m_kNodes.size()), m_bPosesNodes(FindTracks())
+{
+}
+
+// A control anywhere else could pose a node as well, so that there must be none.
+bool CMotionSampler::FindTracks()
+{
+    std::vector<CObject*> controls;
+    m_kRoot.FindObjects(controls, nullptr, &CControl::ms_kRTTI, true);
+    size_t trackCount = 0;
+    for (size_t i = 0; i < m_kNodes.size(); ++i)
+    {
+        CControl* const control = m_kNodes[i]->GetControl();
+        if (!control)
+            continue;
+        if (!StandsAlone(*control, *m_kNodes[i]))
+            return false;
+        m_kTracks[i] = static_cast<CKeyframeControl*>(control);
+        ++trackCount;
+    }
+    return trackCount == controls.size();
+}
+
+void CMotionSampler::PoseNode(size_t index, float time)
+{
+    if (m_kTracks[index])
+        m_kTracks[index]->UpdateTransform(time);
+}
+
+void CMotionSampler::PoseTree(float time)
+{
+    if (!m_bPosesNodes)
+        return m_kRoot.UpdateScene(time, true);
+    for (size_t i = 0; i < m_kNodes.size(); ++i)
+        PoseNode(i, time);
+}
+
+float TimeOfFrame(int i, float frequency, float frameScale)
+{
+    const float time = static_cast<float>(i) / (frequency * frameScale);
+    const float frame = static_cast<float>(i) / frameScale;
+    if (frame != std::floor(frame))
+        return time;
+    // On a key: of the neighbours that differ in the last place, one often gives the key's own time.
+    for (const float towards : {0.0f, std::numeric_limits<float>::infinity()})
+    {
+        const float neighbour = std::nextafter(time, towards);
+        if (time * frequency != frame && neighbour * frequency == frame)
+            return neighbour;
+    }
+    return time;
+}
+
+} // namespace gw

@@ -1,0 +1,53 @@
+#include "MotionNode.h"
+
+#include "CBoneMesh.h"
+#include "CKeyframeControl.h"
+
+#include <algorithm>
+
+namespace gw {
+
+bool KeyTimesFit(int frameCount, size_t nodeCount, size_t fileBytes)
+{
+    // A row takes two bytes a node at the least, so that files of the usual kind stay far below this.
+    constexpr size_t kTimesPerByte = 4;
+    constexpr size_t kAnySize = 65536;
+    const auto frames = static_cast<size_t>(std::max(frameCount, 0));
+    return frames <= (fileBytes * kTimesPerByte + kAnySize) / std::max<size_t>(nodeCount, 1);
+}
+
+CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, const Mat4& restMatrix)
+{
+    auto* const track = new CKeyframeControl;
+    node.AttachControl(track);
+    track->m_fFrequency = frequency;
+    track->m_fEndTime = static_cast<float>(frameCount) - 1.0f;
+    track->m_kRestMatrix = restMatrix;
+    track->m_bHasRestMatrix = true;
+    track->m_kKeyTimes.resize(static_cast<size_t>(std::max(frameCount, 0)));
+    for (size_t i = 0; i < track->m_kKeyTimes.size(); ++i)
+        track->m_kKeyTimes[i] = static_cast<float>(i);
+    return *track;
+}
+
+CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length)
+{
+    CBoneMesh* mesh = nullptr;
+    if (childCount > 1)
+        mesh = new CBoneNodeMesh;
+    else
+        mesh = new CBoneShapeMesh;
+    node.AttachChild(mesh);
+    mesh->SetName(name.c_str());
+    mesh->Build(length);
+    return *mesh;
+}
+
+CNode& AttachNode(CNode& parent)
+{
+    auto* const node = new CNode;
+    parent.AttachChild(node);
+    return *node;
+}
+
+} // namespace gw

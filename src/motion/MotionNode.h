@@ -1,0 +1,32 @@
+#pragma once
+
+#include "CNode.h"
+
+#include <cstddef>
+#include <string>
+
+namespace gw {
+
+class CBoneMesh;
+class CKeyframeControl;
+
+/// More bones than any skeleton has. Each is three scene objects, of which there can be 8 million, and
+/// attaching a child takes time by the number of its brothers.
+inline constexpr size_t kBoneLimit = 32768;
+
+/// Whether that many key times on that many nodes are in proportion to the file that asks for them: a count
+/// of frames is taken at its word, whatever rows follow.
+bool KeyTimesFit(int frameCount, size_t nodeCount, size_t fileBytes);
+
+/// Gives a node a new track without keys: times 0, 1, ... in frames, the frame time in seconds as frequency,
+/// and a rest matrix.
+CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, const Mat4& restMatrix);
+
+/// Gives a node a bone mesh of its name and of a length: a ball where the bone has more than one child, else
+/// a tapered bone. A length of 0 or below leaves the mesh empty.
+CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length);
+
+/// A new child of a node.
+CNode& AttachNode(CNode& parent);
+
+} // namespace gw

@@ -1,0 +1,180 @@
+#include "TKBVHStream.h"
+
+#include "Angles.h"
+#include "CBVHHierarchyReader.h"
+#include "CBVHRowReader.h"
+#include "CBoneMesh.h"
+#include "CKeyframeControl.h"
+#include "MotionNode.h"
+#include "Numbers.h"
+#include "TKBVHFile.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr float kNoLength = 9.9999997e-07f; // the float of 1e-06, below which an offset has no direction
+constexpr size_t kLongestQuote = 80;        // of a word in the failure record
+
+float SignedBy(float sign, double angle)
+{
+    return static_cast<float>(sign < 0.0f ? -angle : angle);
+}
+
+// Turns +Y, the axis of a bone mesh, to where a child stands: about Z by the offset's direction in the XY
+// plane, about Y by that in the XZ plane.
+Mat3 TowardsChild(const Vec3& offset)
+{
+    float aboutZ = 0.0f;
+    float aboutY = 0.0f;
+    if (Vec3Length(offset) >= kNoLength)
+    {
+        const Vec3 p = Vec3Normalized({offset.x, offset.y, 0.0f});
+        const Vec3 q = Vec3Normalized({offset.x, 0.0f, offset.z});
+        if (p != kVec3Zero)
+            aboutZ = SignedBy(p.y, SafeAcos(p.x));
+        if (q != kVec3Zero)
+            aboutY = SignedBy(q.z, kHalfPi64 - SafeAcos(std::fabs(q.z)));
+    }
+    const Mat3 b = Mat3FromAxisAngle(kVec3UnitZ, aboutZ) * Mat3FromAxisAngle(kVec3UnitY, -aboutY);
+    return Mat3FromAxisAngle(kVec3UnitZ, -kHalfPi) * b;
+}
+
+float LongestOffset(const TKBVHJoint& joint)
+{
+    double longest = 0.0;
+    for (const auto& child : joint.children)
+        longest = std::max(longest, Vec3Length(child->offset));
+    return static_cast<float>(longest);
+}
+
+} // namespace
+
+bool TKBVHStream::Load(const std::string& path)
+{
+    m_kRecord.Clear();
+    if (!ReadLines(path))
+        return false;
+    TKBVHFile file;
+    for (std::string_view rest; lines.Next(rest);)
+    {
+        const std::string_view keyword = NextToken(rest);
+        if (keyword == "HIERARCHY" && !CBVHHierarchyReader(lines, file, m_kRecord).Read())
+            return false;
+        if (keyword == "MOTION" && !ReadMotion(file))
+            return false;
+    }
+    return BuildAnimatedTree(file);
+}
+
+bool TKBVHStream::ReadMotion(TKBVHFile& file)
+{
+    TKBVHJoint* const root = file.FirstRoot();
+    if (!root)
+        return m_kRecord.Fail(EFailure::NoRoot, lines.LineNumber(), "ROOT");
+    std::string_view number;
+    if (!ReadNumber("Frames:", number))
+        return false;
+    file.frameCount = ParseInt(number);
+    const size_t countLine = lines.LineNumber();
+    if (!ReadFrameTime(file))
+        return false;
+    const auto frameCount = static_cast<size_t>(std::max(file.frameCount, 0));
+    CBVHRowReader rows(*root, m_kRecord);
+    if (!rows.RowsFit(frameCount, lines.BytesLeft()))
+        return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
+    if (!KeyTimesFit(file.frameCount, file.jointCount, lines.ByteCount()))
+        return m_kRecord.Fail(EFailure::BadCount, countLine, "Frames:");
+    if (!rows.ReadRows(lines, frameCount))
+        return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
+    return true;
+}
+
+// The next line, which must begin with these words. No blank line may stand before it.
+bool TKBVHStream::ReadKeyword(std::string_view words, std::string_view& rest)
+{
+    const std::string name(words);
+    if (!lines.Next(rest))
+        return m_kRecord.Fail(EFailure::MissingSection, lines.LineNumber(), name);
+    std::string_view copy = rest;
+    if (NextToken(copy).empty())
+        return m_kRecord.Fail(EFailure::BlankLine, lines.LineNumber(), name);
+    for (std::string_view word = NextToken(words); !word.empty(); word = NextToken(words))
+    {
+        if (NextToken(rest) != word)
+            return m_kRecord.Fail(EFailure::UnexpectedLine, lines.LineNumber(), name);
+    }
+    return true;
+}
+
+// The number behind these words on the next line, for which it must be finite.
+bool TKBVHStream::ReadNumber(std::string_view words, std::string_view& number)
+{
+    std::string_view rest;
+    if (!ReadKeyword(words, rest))
+        return false;
+    number = NextToken(rest);
+    if (number.empty())
+        return m_kRecord.Fail(EFailure::MissingTokens, lines.LineNumber(), std::string(words));
+    const std::string quote(number.substr(0, kLongestQuote));
+    ENumber kind;
+    ParseDouble(number, kind);
+    if (kind == ENumber::None || kind == ENumber::Unusual)
+        return m_kRecord.Fail(EFailure::BadNumber, lines.LineNumber(), quote);
+    if (kind == ENumber::Stuck)
+        m_kRecord.Warn(EFailure::StuckNumber, lines.LineNumber(), quote);
+    return true;
+}
+
+bool TKBVHStream::ReadFrameTime(TKBVHFile& file)
+{
+    std::string_view number;
+    if (!ReadNumber("Frame Time:", number))
+        return false;
+    file.frameTime = static_cast<float>(ParseDouble(number));
+    if (file.frameTime > 0.0f && std::isfinite(file.frameTime))
+        return true;
+    return m_kRecord.Fail(EFailure::BadNumber, lines.LineNumber(),
+                          std::string(number.substr(0, kLongestQuote)));
+}
+
+bool TKBVHStream::BuildAnimatedTree(TKBVHFile& file)
+{
+    TKBVHJoint* const root = file.FirstRoot();
+    if (!root)
+        return m_kRecord.Fail(EFailure::MissingSection, lines.LineNumber(), "HIERARCHY");
+    motionRoot = new CNode;
+    BuildNode(file, *root, *motionRoot);
+    return true;
+}
+
+void TKBVHStream::BuildNode(TKBVHFile& file, TKBVHJoint& joint, CNode& node)
+{
+    node.SetName(joint.name.c_str());
+    CKeyframeControl& track =
+        AttachTrack(node, file.frameCount, file.frameTime, Mat4Compose(kMat3Identity, joint.offset));
+    track.m_kRotationKeys = std::move(joint.rotationKeys);
+    track.m_kPositionKeys = std::move(joint.positionKeys);
+    track.m_kScaleKeys.assign(track.m_kRotationKeys.size(), kVec3One);
+    AddBoneShape(file, joint, node);
+    for (const auto& child : joint.children)
+    {
+        if (child->kind == EJointKind::Joint)
+            BuildNode(file, *child, AttachNode(node));
+    }
+}
+
+void TKBVHStream::AddBoneShape(const TKBVHFile&, const TKBVHJoint& joint, CNode& node)
+{
+    if (joint.children.empty())
+        return;
+    CBoneMesh& mesh = AttachBone(node, joint.name, joint.children.size(), LongestOffset(joint));
+    if (joint.children.size() == 1)
+        mesh.m_kMatrix = Mat4Compose(TowardsChild(joint.children[0]->offset), kVec3Zero);
+}
+
+} // namespace gw
