@@ -12,6 +12,7 @@
 
 namespace gw {
 
+class CBoneOffsetDialog;
 class CCntComboExControl;
 
 /// What an open or save dialog begins with. A filter is pairs of text and pattern, "|" after each, "||" at
@@ -89,13 +90,13 @@ public:
     virtual void SetTimer(int, int) {}
     virtual void KillTimer(int) {}
 
-    // The profile editor's dialog
+    // The profile editor's dialog, which shows what the editor's model answers
 
     virtual void ShowProfileEditor(bool) {}
-    /// Whether the dialog exists and is visible.
-    virtual bool IsProfileEditorVisible() const { return false; }
-    /// The editor's model changed: rows, trees, fields or buttons.
+    /// The editor's model changed: rows, trees, fields, buttons or whether it is visible.
     virtual void RefreshProfileEditor() {}
+    /// Shows the offset dialog until the user ends it: true on OK.
+    virtual bool RunBoneOffset(CBoneOffsetDialog&) { return false; }
 
     // The desktop around it
 

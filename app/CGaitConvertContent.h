@@ -20,10 +20,13 @@ class CBoneMapProfile;
 class CContentWindow;
 class CPlatform;
 class CProfileEditorDialog;
-struct CFolderChoice;
+struct SourceTiming;
 
 /// Where the target's root stands in the rest pose and in the first frame, in the target skeleton's own unit.
 inline constexpr Vec3 kRootPosition{0.0f, 923.0f, 13.0f};
+
+/// The playbar's last value; the whole motion lies between 0 and this.
+inline constexpr int kScrollRange = 256;
 
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
@@ -75,6 +78,8 @@ public:
     void RefreshProfileList();
     void PruneProfileList();
     void SelectProfileByName(const std::string& name);
+    /// Loads a profile that need not be in the list, as if it had been chosen there.
+    void UseProfileFile(const std::string& path);
     void PickStockProfile();
 
     EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
@@ -83,6 +88,7 @@ public:
     std::string FindProfilePath(const std::string& name) override;
     std::string ProfileFile(const std::string& name) override;
     std::string ExeFile(const std::string& name) override;
+    bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
 
     // Help
 
@@ -109,61 +115,63 @@ public:
 
 private:
     struct Command;
-    struct ControlState;
-    struct Timing;
-    class CWaitCursor;
+    enum class EBatchStep : uint8_t;
 
     // CGaitConvertContent.cpp
     bool LoadSource(const std::string& path);
     bool LoadSourceScene(const std::string& path);
     bool LoadMotion(CMotionFile& motion, const std::string& path);
-    void LoadTarget();
     void ShowSource();
-    void HandScenesToProfile();
+    std::string SourceFolder() const;
     void RememberFolder(const std::string& path);
-    void SetResultScene();
-    CNode* ContainerRoot() const;
+    std::string BaseFile() { return ExeFile("base.htr"); }
+    void Report(const std::string& path, const CFailureRecord& record);
 
     // ConvertMotion.cpp
-    bool Retarget(bool useLegs);
-    bool CanRetarget();
-    Timing SourceTiming() const;
+    bool PrepareRetargeter();
+    void Retarget(const SourceTiming& timing, bool useLegs);
     void NormalizeBasePose();
     void ReportMisfit();
+    bool ReportMissingBones();
 
     // SaveResult.cpp
-    bool WritePackage(const std::string& path, float frameScale);
-    bool SaveMotion(const std::string& path, float frameScale);
+    bool WritePackage(const std::string& path);
+    bool SaveMotion(const std::string& path, float rate);
+    int ProfileRate() const;
+    static std::string WithExtension(const std::string& path, std::string_view extension);
 
     // ConvertBatch.cpp
-    enum class EBatchStep : uint8_t;
+    void ShowBatchFile(const std::string& path, size_t index, size_t count);
     EBatchStep ConvertFile(const std::string& path);
     EBatchStep PackageFile(const std::string& path);
     bool SelectProfileAgain();
 
     // ControlStates.cpp
     uint32_t ControlFacts() const;
+    uint32_t ProfileFacts() const;
     void ShowHighlights();
 
     // Commands.cpp
+    void ForViews(void (CMotionView::*operation)());
     template <auto Operation>
-    void OnBothViews();
+    void Run();
+    template <auto Operation>
+    void OnViews();
     template <auto Operation>
     void OnResultView();
+    void RequestClose();
+    void OpenSourceOrRunBatch();
     void TogglePlay();
     void StopAndRewind();
     void PlayResult();
-    void OpenOrBatch();
     void ToggleProfileEditor();
 
     // ProfileList.cpp
     void AddProfiles(const std::string& folder, int userData);
     void ChooseProfile();
+    void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);
     bool IsListed(const std::string& name) const;
-
-    // Reports.cpp
-    void Report(const std::string& path, const CFailureRecord& record);
 
     CContentWindow& m_kWindow;
     CPlatform& m_kPlatform;
@@ -172,6 +180,7 @@ private:
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
+    std::string m_kSourcePath;   ///< of the file that was opened last
     CMotionFile m_kBaseMotion;   ///< base.htr as it is, for the editor's target tree
     CMotionFile m_kResultMotion; ///< base.htr again, into which the motion is baked
     CRetargeter m_kRetargeter;
@@ -184,6 +193,7 @@ private:
     bool m_bConverted = false;                ///< a conversion has been made for the open source
     bool m_bSaved = true;                     ///< the result has been saved, or there was none
     CBoneMapProfile* m_pkProfile = nullptr;   ///< the editor's
+    CFailureRecord m_kWriteRecord;            ///< what the last WriteResult failed on
 };
 
 } // namespace gw

@@ -1,0 +1,193 @@
+#include "CGaitConvertContent.h"
+
+#include "AttachBoneMeshes.h"
+#include "CContentWindow.h"
+#include "CPlatform.h"
+#include "CProfileEditorDialog.h"
+#include "CWaitCursor.h"
+#include "FailureWords.h"
+#include "Paths.h"
+#include "SourceTiming.h"
+#include "StringTable.h"
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kContainerExtension = ".orn";
+constexpr const char* kFolderSetting = "MotionSource";
+
+void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
+{
+    if (view)
+        view->SetScene(root, timing.FrameStep(), timing.lastFrame);
+}
+
+} // namespace
+
+CGaitConvertContent::CGaitConvertContent(CContentWindow& window, CPlatform& platform)
+    : m_kWindow(window), m_kPlatform(platform)
+{
+    m_kResources.OpenLibrary(platform.DataFolder() + "GaitForgeRes.dll", platform.ThreadLocale());
+}
+
+CGaitConvertContent::~CGaitConvertContent() = default;
+
+bool CGaitConvertContent::OnInitContent()
+{
+    m_pkSourceView = m_kWindow.CreateView("#cnt1");
+    m_pkResultView = m_kWindow.CreateView("#cnt2");
+    RefreshProfileList();
+    m_pkProfileDialog = std::make_unique<CProfileEditorDialog>(*this);
+    m_pkProfileDialog->SetNamesInUse(&m_kProfileNames);
+    m_pkProfile = m_pkProfileDialog.get();
+    m_kWindow.SetChildScrollRange("|playbar", 0, kScrollRange);
+    UpdateControls();
+    return m_pkSourceView && m_pkResultView;
+}
+
+bool CGaitConvertContent::ConfirmDiscard()
+{
+    if (!m_bConverted || m_bSaved)
+        return true;
+    const EAnswer answer = ShowMessage(kSaveResultMessage, EButtons::YesNoCancel);
+    if (answer == EAnswer::Yes)
+        return SaveResult() != 0; // always: whoever then cancels the save dialog loses the result
+    return answer == EAnswer::No;
+}
+
+bool CGaitConvertContent::MayClose()
+{
+    if (m_pkProfile)
+        m_pkProfile->PromptSaveChanges();
+    return ConfirmDiscard();
+}
+
+int CGaitConvertContent::OpenSource()
+{
+    if (!ConfirmDiscard())
+        return 0;
+    const auto path = m_kWindow.AskOpenFile({"bvh", Message(kOpenFilterMessage), SourceFolder()});
+    if (!path)
+        return 1;
+    m_kWindow.RedrawFrame();
+    const CWaitCursor wait(m_kWindow);
+    if (m_pkSourceView)
+        m_pkSourceView->Stop();
+    if (!LoadSource(*path))
+    {
+        ShowMessage(kInvalidSourceMessage, EButtons::OK);
+        return 0;
+    }
+    m_kSourcePath = *path;
+    RememberFolder(*path);
+    ShowSource();
+    PickStockProfile();
+    if (m_pkProfile)
+        m_pkProfile->ApplyProfile(nullptr, nullptr, nullptr);
+    UpdateControls();
+    // Only now, so that "apply" keeps the state of the result before until the next update.
+    m_bConverted = false;
+    m_bSaved = false;
+    return 1;
+}
+
+// A motion file leaves the container flag as it stands: once a container has been open, its scene stays the
+// source.
+bool CGaitConvertContent::LoadSource(const std::string& path)
+{
+    if (HasExtension(path, kContainerExtension))
+        return LoadSourceScene(path);
+    return LoadMotion(m_kSourceMotion, path);
+}
+
+bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& path)
+{
+    const bool loaded = motion.Load(path);
+    Report(path, motion.Record());
+    return loaded;
+}
+
+// Reads beside the scene that is open, since a damaged file must leave it as it is.
+bool CGaitConvertContent::LoadSourceScene(const std::string& path)
+{
+    COrrinStream stream;
+    const bool read = stream.LoadFile(path, false);
+    CFailureRecord record = stream.Record();
+    if (read && !record.Failure() && !PreviewTrack(FirstNode(stream.GetRoot(0))))
+        record.Fail(EFailure::NoTrack);
+    Report(path, record);
+    if (!read || record.Failure())
+        return false;
+    m_spkSourceScene.RemoveAllRoots();
+    for (size_t i = 0; i < stream.GetRootCount(); ++i)
+        m_spkSourceScene.AddRoot(stream.GetRoot(i));
+    m_bSourceIsContainer = true;
+    return true;
+}
+
+// Shows the source that was loaded, takes the target skeleton twice and hands all three to the profile
+// editor.
+void CGaitConvertContent::ShowSource()
+{
+    CNode* const root = SourceRoot();
+    if (m_bSourceIsContainer)
+        AttachBoneMeshes(root);
+    SetScene(m_pkSourceView.get(), root,
+             m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
+    LoadMotion(m_kBaseMotion, BaseFile());
+    m_kResultMotion.Load(BaseFile());
+    if (m_pkProfile)
+    {
+        m_pkProfile->SetSourceScene(root);
+        m_pkProfile->SetTargetScene(m_kBaseMotion.motionRoot.Get());
+        m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
+    }
+    SetScene(m_pkResultView.get(), nullptr, {});
+}
+
+CNode* CGaitConvertContent::SourceRoot() const
+{
+    return m_bSourceIsContainer ? FirstNode(m_spkSourceScene.GetRoot(0)) : m_kSourceMotion.motionRoot.Get();
+}
+
+std::string CGaitConvertContent::SourceFolder() const
+{
+    return m_kPlatform.ReadSetting(kFolderSetting);
+}
+
+void CGaitConvertContent::RememberFolder(const std::string& path)
+{
+    m_kPlatform.WriteSetting(kFolderSetting, SplitPath(path).folder);
+}
+
+std::string CGaitConvertContent::Message(int id) const
+{
+    std::string text;
+    m_kResources.LoadResString(id, text);
+    return text;
+}
+
+EAnswer CGaitConvertContent::ShowMessage(int id, EButtons buttons, std::span<const int> numbers)
+{
+    std::vector<std::string> arguments;
+    for (const int number : numbers)
+        arguments.push_back(std::to_string(number));
+    return m_kWindow.ShowMessageBox(id, FormatText(Message(id), arguments), buttons);
+}
+
+void CGaitConvertContent::SetTitle(const std::string& text)
+{
+    const std::string product = Message(kTitleMessage);
+    m_kWindow.SetChildText("#title", text.empty() ? product : product + " - " + text);
+}
+
+void CGaitConvertContent::Report(const std::string& path, const CFailureRecord& record)
+{
+    if (record.Failure())
+        m_kWindow.Report(MakeReport(path, record.Failure(), false));
+    for (const CFailure& warning : record.Warnings())
+        m_kWindow.Report(MakeReport(path, warning, true));
+}
+
+} // namespace gw

@@ -1,0 +1,140 @@
+// Which child is enabled when. Every condition is a bit, so that a child's row names what it needs.
+
+#include "CBoneMapProfile.h"
+#include "CCntComboExControl.h"
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CProfileEditorDialog.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+enum EFact : uint32_t
+{
+    kSource = 1 << 0, // there is a source with keys, or one from a container
+    kSourcePlays = 1 << 1,
+    kSourceMoved = 1 << 2, // its view is not at the start
+    kSourceAhead = 1 << 3, // its view is before the end
+    kSourceLong = 1 << 4,  // it has more than one frame, or is from a container
+    kBase = 1 << 5,        // the target skeleton is there
+    kConverted = 1 << 6,
+    kResult = 1 << 7, // converted, with keys
+    kResultPlays = 1 << 8,
+    kResultRests = 1 << 9,
+    kResultMoved = 1 << 10,
+    kResultAhead = 1 << 11,
+    kProfilePath = 1 << 12, // the selected profile has a file
+    kSelection = 1 << 13,   // the list has a selection
+    kRemovable = 1 << 14,   // it is a custom profile of a listed name
+};
+
+struct Row
+{
+    std::string_view m_kChild;
+    uint32_t m_uiNeeds;
+};
+
+constexpr Row kControls[] = {
+    {"play",     kSource                       },
+    {"stop",     kSource | kSourcePlays        },
+    {"back",     kSource | kSourceMoved        },
+    {"fback",    kSource | kSourceMoved        },
+    {"end",      kSource | kSourceAhead        },
+    {"fend",     kSource | kSourceAhead        },
+    {"play1",    kResult | kResultRests        },
+    {"stop1",    kResult | kResultPlays        },
+    {"start1",   kResult | kResultMoved        },
+    {"PreFrm1",  kResult | kResultMoved        },
+    {"end1",     kResult | kResultAhead        },
+    {"NextFrm1", kResult | kResultAhead        },
+    {"del",      kRemovable                    },
+    {"apply",    kSource | kBase | kConverted  },
+    {"convert",  kSource | kBase | kProfilePath},
+    {"%adv",     kSelection                    },
+    {"|playbar", kSourceLong                   },
+};
+
+// A view's clock; one that does not exist rests at the start of nothing.
+struct Clock
+{
+    explicit Clock(const CMotionView* view)
+    {
+        if (!view)
+            return;
+        m_bPlays = view->IsPlaying();
+        m_fTime = view->GetTime();
+        m_fEnd = view->GetLastFrame() != 0.0f ? view->GetFrameStep() * view->GetLastFrame() : 0.0f;
+    }
+
+    bool m_bPlays = false;
+    float m_fTime = 0.0f;
+    float m_fEnd = 0.0f;
+};
+
+uint32_t When(bool holds, uint32_t fact)
+{
+    return holds ? fact : 0;
+}
+
+int ScrollValue(const Clock& clock)
+{
+    const float value = clock.m_fEnd != 0.0f ? clock.m_fTime * kScrollRange / clock.m_fEnd : 0.0f;
+    return std::isfinite(value) ? static_cast<int>(std::lround(value)) : 0;
+}
+
+} // namespace
+
+uint32_t CGaitConvertContent::ControlFacts() const
+{
+    const Clock source(m_pkSourceView.get());
+    const Clock result(m_pkResultView.get());
+    return When(m_bSourceIsContainer || m_kSourceMotion.GetKeyCount() > 0, kSource) |
+           When(source.m_bPlays, kSourcePlays) | When(source.m_fTime != 0.0f, kSourceMoved) |
+           When(source.m_fTime < source.m_fEnd, kSourceAhead) |
+           When(m_bSourceIsContainer || m_kSourceMotion.GetLastFrame() != 0.0f, kSourceLong) |
+           When(m_kBaseMotion.GetKeyCount() > 0, kBase) | When(m_bConverted, kConverted) |
+           When(m_bConverted && m_kResultMotion.GetKeyCount() > 0, kResult) |
+           When(result.m_bPlays, kResultPlays) | When(!result.m_bPlays, kResultRests) |
+           When(result.m_fTime != 0.0f, kResultMoved) | When(result.m_fTime < result.m_fEnd, kResultAhead) |
+           ProfileFacts();
+}
+
+uint32_t CGaitConvertContent::ProfileFacts() const
+{
+    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const int index = list.GetCurSel();
+    const std::string* const text = list.GetItemText(index);
+    return When(!m_kProfilePath.empty(), kProfilePath) | When(text, kSelection) |
+           When(text && list.GetItemUserData(index) == 0 && IsListed(*text), kRemovable);
+}
+
+void CGaitConvertContent::UpdateControls()
+{
+    const uint32_t facts = ControlFacts();
+    for (const Row& row : kControls)
+        m_kWindow.EnableChild(row.m_kChild, (facts & row.m_uiNeeds) == row.m_uiNeeds);
+    const bool plays = (facts & kSourcePlays) != 0;
+    m_kWindow.SetChildFace("play", plays ? 1 : 0);
+    m_kWindow.SetChildSecondState("play", plays);
+    m_kWindow.SetChildButtonState("%adv", m_pkProfileDialog && m_pkProfileDialog->IsVisible());
+    m_kWindow.SetChildScrollValue("|playbar", ScrollValue(Clock(m_pkSourceView.get())));
+    ShowHighlights();
+}
+
+void CGaitConvertContent::ShowHighlights()
+{
+    if (!m_pkProfile || !m_pkSourceView || !m_pkResultView)
+        return;
+    std::string source, target;
+    m_pkProfile->GetSelectedSourceBone(source);
+    m_pkProfile->GetSelectedTargetBone(target);
+    m_pkSourceView->SetHighlight(source);
+    m_pkResultView->SetHighlight(target);
+    m_pkSourceView->Repaint();
+    m_pkResultView->Repaint();
+}
+
+} // namespace gw

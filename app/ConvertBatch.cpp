@@ -1,0 +1,116 @@
+// One folder, every file of a kind, no questions: sources to HTR files, or HTR files to containers.
+
+#include "CCntComboExControl.h"
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CProfileEditorDialog.h"
+#include "CWaitCursor.h"
+#include "FailureWords.h"
+#include "Packaging.h"
+#include "Paths.h"
+#include "SourceTiming.h"
+#include "StringTable.h"
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kFilter = "BVH file to HTR(*.bvh)|*.bvh|HTR file to ORN(*.htr)|*.htr|";
+// Unlike an interactive save: at a profile rate of 30 the frames stay as many as they are.
+constexpr float kBatchRate = 30.0f;
+constexpr float kPackageRate = 60.0f;
+
+} // namespace
+
+// How a run goes on after a file.
+enum class CGaitConvertContent::EBatchStep : uint8_t
+{
+    Done,
+    Ended,     ///< the run ends with its summary
+    Abandoned, ///< the run ends at once and leaves its title
+};
+
+int CGaitConvertContent::RunBatch()
+{
+    const auto choice = m_kWindow.AskFolder({{}, kFilter, SourceFolder()});
+    if (!choice)
+        return 0;
+    m_kWindow.RedrawFrame();
+    const CWaitCursor wait(m_kWindow);
+    const bool toHtr = choice->filterIndex == 1;
+    const std::string folder = WithSeparator(choice->folder);
+    const std::vector<std::string> names = FilesInFolder(folder, toHtr ? ".bvh" : ".htr");
+    if (names.empty())
+        return 0;
+    EBatchStep step = EBatchStep::Done;
+    size_t finished = 0;
+    while (finished < names.size() && step == EBatchStep::Done)
+    {
+        const std::string path = folder + names[finished];
+        ShowBatchFile(path, finished, names.size());
+        step = toHtr ? ConvertFile(path) : PackageFile(path);
+        finished += step == EBatchStep::Done ? 1 : 0;
+    }
+    if (step == EBatchStep::Abandoned)
+        return 0;
+    const int count[] = {static_cast<int>(finished)};
+    ShowMessage(toHtr ? kConvertedMessage : kPackagedMessage, EButtons::OK, count);
+    SetTitle({});
+    return 1;
+}
+
+void CGaitConvertContent::ShowBatchFile(const std::string& path, size_t index, size_t count)
+{
+    const std::string arguments[] = {std::to_string(index + 1), SplitPath(path).stem};
+    SetTitle(FormatText(Message(kBatchTitleMessage), arguments));
+    m_kWindow.ShowBatchFile(index, count, path);
+    ForViews(&CMotionView::Stop);
+}
+
+CGaitConvertContent::EBatchStep CGaitConvertContent::ConvertFile(const std::string& path)
+{
+    if (!LoadMotion(m_kSourceMotion, path))
+    {
+        ShowMessage(kInvalidSourceMessage, EButtons::OK);
+        return EBatchStep::Ended;
+    }
+    m_bSourceIsContainer = false;
+    m_kSourcePath = path;
+    RememberFolder(path);
+    ShowSource();
+    if (!SelectProfileAgain() || !PrepareRetargeter())
+    {
+        ShowMessage(kCannotConvertMessage, EButtons::OK);
+        return EBatchStep::Abandoned;
+    }
+    Retarget(TimingOf(m_kSourceMotion), true); // Shift has no say here
+    m_kWriteRecord.Clear();
+    const bool saved = SaveMotion(WithExtension(path, ".htr"), kBatchRate);
+    Report(path, m_kWriteRecord);
+    return saved ? EBatchStep::Done : EBatchStep::Ended;
+}
+
+// The profile is read from its file again for every source.
+bool CGaitConvertContent::SelectProfileAgain()
+{
+    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const std::string* const selected = list.GetItemText(list.GetCurSel());
+    if (!selected)
+    {
+        m_kWindow.Report(MakeReport({}, EMisfit::NoProfile));
+        return false;
+    }
+    SelectProfileByName(std::string(*selected));
+    return true;
+}
+
+CGaitConvertContent::EBatchStep CGaitConvertContent::PackageFile(const std::string& path)
+{
+    CFailureRecord record;
+    const bool packaged =
+        PackageMotion(path, WithExtension(path, ".orn"), kPackageRate, kPackageRate, record);
+    Report(path, record);
+    return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
+}
+
+} // namespace gw

@@ -1,0 +1,129 @@
+// From the open source and the profile to the target's motion.
+
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CProfileEditorDialog.h"
+#include "CWaitCursor.h"
+#include "FailureWords.h"
+#include "FindBone.h"
+#include "Mat4.h"
+#include "SourceTiming.h"
+#include "StringTable.h"
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kRootBone = "LowerTorso";
+
+// Rows divided by their lengths and multiplied by them again, as results have always been made; a row of
+// length 0 is left alone.
+void RebuildRows(Mat4& matrix)
+{
+    const Vec3 lengths = RowLengths(matrix);
+    const float length[] = {lengths.x, lengths.y, lengths.z};
+    for (int row = 0; row < 3; ++row)
+    {
+        float* const element = matrix.m + 4 * row;
+        for (int column = 0; column < 3 && length[row] != 0.0f; ++column)
+            element[column] = element[column] / length[row] * length[row];
+        element[3] = 0.0f;
+    }
+}
+
+} // namespace
+
+int CGaitConvertContent::ConvertMotion()
+{
+    const CWaitCursor wait(m_kWindow);
+    ForViews(&CMotionView::Stop);
+    LoadMotion(m_kResultMotion, BaseFile());
+    if (m_pkProfile)
+        m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
+    if (!PrepareRetargeter())
+    {
+        ShowMessage(kCannotConvertMessage, EButtons::OK);
+        return 0;
+    }
+    const bool useLegs = !m_kWindow.IsKeyDown(EKey::LeftShift);
+    Retarget(m_bSourceIsContainer ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(m_kSourceMotion),
+             useLegs);
+    if (m_pkSourceView)
+        m_pkSourceView->Seek(0, kScrollRange);
+    m_bConverted = true;
+    UpdateControls();
+    return 1;
+}
+
+// Fills the retargeter's tables from the profile. False, with the reason reported, when they cannot drive a
+// conversion.
+bool CGaitConvertContent::PrepareRetargeter()
+{
+    const bool ready = m_pkProfile && m_pkProfile->ApplyProfile(&m_kRetargeter, nullptr, nullptr) &&
+                       m_pkProfile->HasRootMapping() &&
+                       m_kRetargeter.SourceOf(FindBone(m_kResultMotion.motionRoot.Get(), kRootBone));
+    if (!ready)
+        ReportMisfit();
+    return ready;
+}
+
+void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
+{
+    m_kRetargeter.Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
+    Report(m_kSourcePath, m_kRetargeter.Record());
+    const SourceTiming result = TimingOf(m_kResultMotion);
+    if (m_pkResultView)
+        m_pkResultView->SetScene(m_kResultMotion.motionRoot.Get(), result.FrameStep(), result.lastFrame);
+    NormalizeBasePose();
+}
+
+// Puts the rest pose's root where the motion's root begins; rotation and scale stay.
+void CGaitConvertContent::NormalizeBasePose()
+{
+    CNode* const root = FindBone(m_kResultMotion.restRoot.Get(), kRootBone);
+    if (!root)
+        return;
+    RebuildRows(root->m_kMatrix);
+    root->m_kMatrix.SetTranslation(kRootPosition);
+    root->m_kMatrix.m[15] = 1.0f;
+}
+
+// Message 144 says only that a profile does not fit; this says why.
+void CGaitConvertContent::ReportMisfit()
+{
+    EMisfit misfit = EMisfit::NoRootSource;
+    if (!SourceRoot() || !m_kResultMotion.motionRoot)
+        misfit = EMisfit::NoScene;
+    else if (m_kProfilePath.empty())
+        misfit = EMisfit::NoProfile;
+    else if (ReportMissingBones())
+        return;
+    else if (!m_pkProfile->HasRootMapping())
+        misfit = EMisfit::NoRootRow;
+    m_kWindow.Report(MakeReport(m_kProfilePath, misfit));
+}
+
+// Reports each row that names a bone which is not there; false when there is none.
+bool CGaitConvertContent::ReportMissingBones()
+{
+    const CBoneNames sources(SourceRoot());
+    const CBoneNames targets(m_kResultMotion.motionRoot.Get());
+    const CMapRowTable& rows = m_pkProfileDialog->Rows();
+    bool found = false;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        const std::string& source = rows.Text(row, kSourceColumn);
+        const std::string& target = rows.Text(row, kTargetColumn);
+        const bool hasSource = rows.IsFixed(row) || sources.Find(source);
+        if (!hasSource)
+            m_kWindow.Report(MakeReport(m_kProfilePath, EMisfit::NoSourceBone, source));
+        else if (!targets.Find(target))
+            m_kWindow.Report(MakeReport(m_kProfilePath, EMisfit::NoTargetBone, target));
+        else
+            continue;
+        found = true;
+    }
+    return found;
+}
+
+} // namespace gw

@@ -1,0 +1,33 @@
+#pragma once
+
+#include "CFailure.h"
+#include "CReport.h"
+
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+/// Why a motion cannot be converted although it could be read.
+enum class EMisfit : uint8_t
+{
+    NoScene,      ///< no source is open, or base.htr could not be read
+    NoProfile,    ///< no profile is selected
+    NoSourceBone, ///< a row names a bone that the source does not have
+    NoTargetBone, ///< a row names a bone that the target does not have
+    NoRootRow,    ///< no row drives the target's root bone
+    NoRootSource, ///< the row of the target's root bone is fixed
+};
+
+/// The short fixed word for a reason.
+std::string_view FailureCode(EFailure reason);
+
+/// A failure or warning of a file, in words: "walk.bvh:12: an empty line ...". Names are made safe to print.
+CReport MakeReport(const std::string& path, const CFailure& failure, bool warning);
+CReport MakeReport(const std::string& path, EMisfit misfit, const std::string& name = {});
+
+/// The report as one line: path, place and words.
+std::string ReportLine(const CReport& report);
+
+} // namespace gw

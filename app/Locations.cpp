@@ -1,0 +1,74 @@
+// Where things lie: the program's own files, the users' profiles, the host product and its help.
+
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CPlatform.h"
+#include "CStringLibrary.h"
+#include "LanguageCode.h"
+#include "Paths.h"
+#include "ProfileNames.h"
+#include "StringTable.h"
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kHelpLibrary = "Kbel.dll";
+constexpr uint32_t kHelpFileString = 32824;
+constexpr size_t kHelpNameLimit = 260; // characters
+
+} // namespace
+
+std::string CGaitConvertContent::ExeFile(const std::string& name)
+{
+    return m_kPlatform.DataFolder() + name;
+}
+
+std::string CGaitConvertContent::ProfileFile(const std::string& name)
+{
+    std::string folder = m_kPlatform.ReadHostKey(Message(kCustomFolderKeyMessage), "Custom Data");
+    if (folder.empty())
+        folder = m_kPlatform.DocumentsFolder();
+    folder = WithSeparator(WithSeparator(std::move(folder)) + "BVH Profile");
+    m_kPlatform.MakeFolder(folder);
+    return folder + name;
+}
+
+bool CGaitConvertContent::LocateHost(std::string& path)
+{
+    path = m_kPlatform.ReadHostKey(Message(kHostKeyMessage), Message(kHostProgramMessage));
+    if (path.empty())
+        ShowMessage(kNoHostMessage, EButtons::OK);
+    return !path.empty();
+}
+
+bool CGaitConvertContent::LocateHelp(std::string& path)
+{
+    std::string host;
+    if (!LocateHost(host))
+        return false;
+    const std::string folder = SplitPath(host).folder;
+    CStringLibrary library;
+    if (!library.Open(folder + kHelpLibrary))
+        return false;
+    std::string name;
+    path.clear();
+    if (!library.LoadString(kHelpFileString, m_kPlatform.ThreadLocale(), name))
+        return true;
+    path = folder + std::string(FirstCharacters(name, kHelpNameLimit));
+    return FileExists(path);
+}
+
+void CGaitConvertContent::ShowHelp()
+{
+    std::string path;
+    if (LocateHelp(path))
+    {
+        m_kWindow.OpenHelpFile(path + Message(kHelpTopicMessage));
+        return;
+    }
+    const std::string language[] = {std::string(LanguageCode(m_kPlatform.ThreadLocale()))};
+    m_kWindow.OpenWebPage(FormatText(Message(kWebPageMessage), language));
+}
+
+} // namespace gw

@@ -1,0 +1,220 @@
+// The list of profiles: what stands in it, and what choosing an entry does.
+
+#include "CCntComboExControl.h"
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CPlatform.h"
+#include "CProfileEditorDialog.h"
+#include "Paths.h"
+#include "ProfileFile.h"
+#include "StringTable.h"
+#include "Text.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kProfileExtension = ".prf";
+constexpr const char* kPoserFile = "PoserBVH.prf";
+constexpr const char* kMaxFile = "MaxBVH.prf";
+constexpr int kCustom = 0; // user data of an entry
+constexpr int kStock = 1;
+constexpr int kSelectionChanged = 9; // notification of the list
+
+// The profile of a display name in a folder, or empty.
+std::string FindInFolder(const std::string& folder, const std::string& name)
+{
+    for (const std::string& file : FilesInFolder(folder, kProfileExtension))
+    {
+        if (EqualNoCase(ReadProfileName(folder + file), name))
+            return folder + file;
+    }
+    return {};
+}
+
+int ItemCount(const CCntComboExControl& list)
+{
+    int count = 0;
+    while (list.GetItemText(count))
+        ++count;
+    return count;
+}
+
+// The first entry of a name, or -1.
+int FindItem(const CCntComboExControl& list, const std::string& name)
+{
+    for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
+    {
+        if (EqualNoCase(*text, name))
+            return index;
+    }
+    return -1;
+}
+
+} // namespace
+
+std::string CGaitConvertContent::FindProfilePath(const std::string& name)
+{
+    const std::string stock = FindInFolder(ExeFile({}), name);
+    return stock.empty() ? FindInFolder(ProfileFile({}), name) : stock;
+}
+
+void CGaitConvertContent::RefreshProfileList()
+{
+    m_kWindow.ProfileCombo().DeleteItem(-1);
+    AddProfiles(ExeFile({}), kStock);
+    AddProfiles(ProfileFile({}), kCustom);
+}
+
+void CGaitConvertContent::AddProfiles(const std::string& folder, int userData)
+{
+    for (const std::string& file : FilesInFolder(folder, kProfileExtension))
+    {
+        const std::string name = ReadProfileName(folder + file);
+        m_kWindow.ProfileCombo().AddItem(name, userData);
+        if (userData == kStock && EqualNoCase(file, kPoserFile))
+            m_kPoserProfileName = name;
+        else if (userData == kStock && EqualNoCase(file, kMaxFile))
+            m_kMaxProfileName = name;
+        m_kProfileNames.push_back(name);
+    }
+}
+
+bool CGaitConvertContent::IsListed(const std::string& name) const
+{
+    return std::ranges::any_of(m_kProfileNames,
+                               [&](const std::string& listed) { return EqualNoCase(listed, name); });
+}
+
+// The index moves on after a deletion as well, so that the entry that slid into the place is passed over.
+void CGaitConvertContent::PruneProfileList()
+{
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
+    {
+        if (!IsListed(*text) && index != list.GetCurSel() && FindProfilePath(*text).empty())
+            list.DeleteItem(index);
+    }
+}
+
+// Loading refills the list, which is why every text is copied and looked up anew.
+void CGaitConvertContent::SelectProfileByName(const std::string& name)
+{
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
+    {
+        if (!EqualNoCase(*text, name))
+            continue;
+        list.SetCurSel(index);
+        UseProfileFile(FindProfilePath(name));
+    }
+}
+
+void CGaitConvertContent::UseProfileFile(const std::string& path)
+{
+    m_kProfilePath = path;
+    if (m_pkProfile && !m_kProfilePath.empty())
+        m_pkProfile->LoadProfile(path);
+}
+
+void CGaitConvertContent::OnCntCommand(int code)
+{
+    if (code == kSelectionChanged)
+        ChooseProfile();
+}
+
+void CGaitConvertContent::ChooseProfile()
+{
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const int chosen = list.GetCurSel();
+    PruneProfileList();
+    // The index of before the pruning: an entry that went before the chosen one makes this the next one's
+    // text.
+    const std::string* const text = list.GetItemText(chosen);
+    UseProfileFile(text ? FindProfilePath(*text) : std::string());
+    UpdateControls();
+}
+
+bool CGaitConvertContent::ProfileFits(const std::string& path)
+{
+    int matched = 0;
+    int total = 0;
+    if (m_pkProfile)
+        m_pkProfile->CountMatches(path, &matched, &total);
+    return matched >= 1 && matched == total;
+}
+
+void CGaitConvertContent::PickStockProfile()
+{
+    if (ProfileFits(ExeFile(kPoserFile)))
+    {
+        SelectProfileByName(m_kPoserProfileName);
+        return;
+    }
+    if (!ProfileFits(ExeFile(kMaxFile)))
+        return;
+    // A user's choice outlives an open, unless it is the other stock profile.
+    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const std::string* const selected = list.GetItemText(list.GetCurSel());
+    if (!selected || EqualNoCase(*selected, m_kPoserProfileName))
+        SelectProfileByName(m_kMaxProfileName);
+}
+
+// The profile path goes on naming the deleted file until the next selection.
+void CGaitConvertContent::DeleteSelectedProfile()
+{
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const int index = list.GetCurSel();
+    if (ShowMessage(kRemoveProfileMessage, EButtons::OKCancel) == EAnswer::OK && list.GetItemText(index))
+    {
+        const std::string name = *list.GetItemText(index);
+        DeleteFile(FindProfilePath(name));
+        list.DeleteItem(index);
+        const auto listed =
+            std::ranges::find_if(m_kProfileNames, [&](const std::string& n) { return EqualNoCase(n, name); });
+        if (listed != m_kProfileNames.end())
+            m_kProfileNames.erase(listed);
+        LoadSelectedProfile();
+    }
+    UpdateControls();
+}
+
+void CGaitConvertContent::LoadSelectedProfile()
+{
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    list.SetCurSel(list.GetCurSel());
+    const std::string* const text = list.GetItemText(list.GetCurSel());
+    const std::string path = text ? FindProfilePath(*text) : std::string();
+    if (!path.empty() && m_pkProfile)
+        m_pkProfile->LoadProfile(path);
+}
+
+void CGaitConvertContent::ProfileStateChanged()
+{
+    UpdateControls();
+    m_kWindow.RefreshProfileEditor();
+}
+
+void CGaitConvertContent::ProfileSetChanged()
+{
+    if (!m_pkProfile)
+        return;
+    RefreshProfileList();
+    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    std::string name;
+    m_pkProfile->GetProfileName(name);
+    if (FindItem(list, name) < 0)
+        list.AddItem(name, kCustom);
+    list.SetCurSel(FindItem(list, name));
+    UpdateControls();
+    m_kWindow.RefreshProfileEditor();
+}
+
+bool CGaitConvertContent::RunBoneOffset(CBoneOffsetDialog& dialog)
+{
+    return m_kWindow.RunBoneOffset(dialog);
+}
+
+} // namespace gw

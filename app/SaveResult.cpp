@@ -1,0 +1,86 @@
+// From the target's motion to a file: a Kinetra package around an HTR, or the HTR alone.
+
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CProfileEditorDialog.h"
+#include "CSafeFile.h"
+#include "CWaitCursor.h"
+#include "FailureWords.h"
+#include "Packaging.h"
+#include "Paths.h"
+#include "StringTable.h"
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kPackageExtension = ".Kinetra";
+constexpr std::string_view kMotionExtension = ".htr";
+// The host plays packages at this rate: a result is stored in half-steps of it.
+constexpr float kSavedRate = 120.0f;
+constexpr float kHostRate = 60.0f;
+
+} // namespace
+
+int CGaitConvertContent::SaveResult()
+{
+    const auto path = m_kWindow.AskSaveFile({"Kinetra", Message(kSaveFilterMessage), {}});
+    if (!path)
+        return 1;
+    const CWaitCursor wait(m_kWindow);
+    WriteResult(*path);
+    m_bSaved = true; // whatever became of the files; the title tells
+    SetTitle(m_kWriteRecord.Failure()
+                 ? "not saved: " + MakeReport(*path, m_kWriteRecord.Failure(), false).words
+                 : std::string());
+    if (ShowMessage(kShowFileMessage, EButtons::OKCancel) == EAnswer::OK)
+        m_kWindow.ShowInFileManager(*path);
+    return 1;
+}
+
+bool CGaitConvertContent::WriteResult(const std::string& path)
+{
+    m_kWriteRecord.Clear();
+    const bool written = HasExtension(path, kPackageExtension)
+                             ? WritePackage(path)
+                             : SaveMotion(WithExtension(path, kMotionExtension), kSavedRate);
+    Report(path, m_kWriteRecord);
+    return written;
+}
+
+// The motion lies under a name of its own until it is packaged, so that an HTR beside the chosen name stays
+// as it is.
+bool CGaitConvertContent::WritePackage(const std::string& path)
+{
+    const std::string motionPath = CreatePrivateFile(path, kMotionExtension);
+    if (motionPath.empty())
+        return m_kWriteRecord.Fail(EFailure::WriteError);
+    const bool packaged =
+        SaveMotion(motionPath, kSavedRate) &&
+        PackageMotion(motionPath, path, static_cast<float>(ProfileRate()), kHostRate, m_kWriteRecord);
+    DeleteFile(motionPath);
+    return packaged;
+}
+
+// Writes the result with as many times more frames as a rate stands above the profile's.
+bool CGaitConvertContent::SaveMotion(const std::string& path, float rate)
+{
+    if (ProfileRate() <= 0)
+        return m_kWriteRecord.Fail(EFailure::BadNumber, 0, "FrameRate " + std::to_string(ProfileRate()));
+    const bool saved = m_kResultMotion.Save(path, rate / static_cast<float>(ProfileRate()));
+    const CFailure& failure = m_kResultMotion.Record().Failure();
+    return saved || m_kWriteRecord.Fail(failure.reason, failure.where, failure.name);
+}
+
+int CGaitConvertContent::ProfileRate() const
+{
+    return m_pkProfile ? m_pkProfile->GetFrameRate() : 0;
+}
+
+std::string CGaitConvertContent::WithExtension(const std::string& path, std::string_view extension)
+{
+    const CPathParts parts = SplitPath(path);
+    return parts.folder + parts.stem + std::string(extension);
+}
+
+} // namespace gw

@@ -1,0 +1,31 @@
+#pragma once
+
+namespace gw {
+
+class CKeyframeControl;
+class CMotionFile;
+class CNode;
+class CObject;
+
+/// How long a motion is and how its frames are spaced. Frame f is reached at time f / frequency.
+struct SourceTiming
+{
+    float lastFrame = 0.0f; ///< number of the last frame
+    float frequency = 0.0f; ///< as the tracks have it: the frame time in seconds
+
+    /// The scene's time between two frames; 0 for a motion without frames.
+    float FrameStep() const { return frequency != 0.0f ? 1.0f / frequency : 0.0f; }
+};
+
+SourceTiming TimingOf(const CMotionFile& motion);
+/// No frames for null.
+SourceTiming TimingOf(const CKeyframeControl* track);
+
+/// The first plain node under a container's root, or null.
+CNode* FirstNode(CObject* root);
+/// The track that a container's preview runs by, the first one of its class; null where there is none.
+CKeyframeControl* PreviewTrack(CNode* root);
+/// The track that a container's conversion runs by: an object of a fixed name, else the one of the preview.
+CKeyframeControl* ConversionTrack(CNode* root);
+
+} // namespace gw

@@ -1,0 +1,39 @@
+#pragma once
+
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+/// The messages that the program itself shows, and the texts it looks things up by.
+enum EMessage : int
+{
+    kAboutToolMessage = 101,
+    kTitleMessage = 128,
+    kHostKeyMessage = 131,
+    kHostProgramMessage = 135,
+    kNoHostMessage = 137,
+    kInvalidSourceMessage = 138,
+    kSaveResultMessage = 139,
+    kWebPageMessage = 143,
+    kCannotConvertMessage = 144,
+    kConvertedMessage = 146,
+    kBatchTitleMessage = 147,
+    kPackagedMessage = 148,
+    kCustomFolderKeyMessage = 154,
+    kOpenFilterMessage = 164,
+    kSaveFilterMessage = 165,
+    kRemoveProfileMessage = 166,
+    kHelpTopicMessage = 167,
+    kShowFileMessage = 171,
+};
+
+/// The program's own text of a message, misspellings and all; empty for an unknown id.
+std::string_view BuiltInString(int id);
+
+/// A text with its %d and %s replaced in order. Formats may come from a translation, so whatever else they
+/// hold is copied, and placeholders without an argument become nothing.
+std::string FormatText(std::string_view format, std::span<const std::string> arguments);
+
+} // namespace gw
