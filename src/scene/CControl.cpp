@@ -44,17 +44,16 @@ CControl* CControl::GetLast()
     return last;
 }
 
-float CControl::MapTime(float time) const
+float CControl::CycledTime(float s) const
 {
-    const float s = time * m_fFrequency + m_fPhase;
     if (m_iCycleType == static_cast<uint32_t>(ECycleType::Clamp))
     {
-        if (!(s >= m_fBeginTime))
+        if (s < m_fBeginTime)
             return m_fBeginTime;
         return s <= m_fEndTime ? s : m_fEndTime;
     }
     const float range = m_fEndTime - m_fBeginTime;
-    if (!(range > 0.0f) || !std::isfinite(s) || !std::isfinite(range))
+    if (range <= 0.0f || !std::isfinite(s) || !std::isfinite(range))
         return m_fBeginTime;
     const float x = (s - m_fBeginTime) / range;
     const float period = std::floor(x);
@@ -62,6 +61,13 @@ float CControl::MapTime(float time) const
     const bool backward =
         m_iCycleType != static_cast<uint32_t>(ECycleType::Loop) && std::fmod(period, 2.0f) != 0.0f;
     return backward ? m_fEndTime - distance : distance + m_fBeginTime;
+}
+
+float CControl::MapTime(float time) const
+{
+    const float s = time * m_fFrequency + m_fPhase;
+    const float keyTime = std::isnan(s) ? s : CycledTime(s);
+    return std::isnan(keyTime) ? m_fBeginTime : keyTime;
 }
 
 } // namespace gw

@@ -53,6 +53,8 @@ public:
     bool m_bActive = true; ///< an inactive control does not animate
 
 private:
+    float CycledTime(float s) const;
+
     Watch<CObject> m_pkTarget;
     Held<CControl> m_spkNext;
 };

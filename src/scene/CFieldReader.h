@@ -3,6 +3,7 @@
 #include "CFailure.h"
 #include "CFieldArchive.h"
 
+#include <algorithm>
 #include <span>
 #include <string>
 
@@ -14,7 +15,8 @@ class CFieldReader : public CFieldArchive
 {
 public:
     CFieldReader(std::span<const std::byte> bytes, size_t position, CVersion version, CFailureRecord& record)
-        : CFieldArchive(true, version), m_kBytes(bytes), m_uiPosition(position), m_kRecord(record)
+        : CFieldArchive(true, version), m_kBytes(bytes), m_uiPosition(std::min(position, bytes.size())),
+          m_kRecord(record)
     {
     }
 

@@ -17,6 +17,8 @@ constexpr size_t kHeaderCompared = 16;                          // the digits of
 constexpr size_t kLeastFileBytes = 21;
 constexpr std::string_view kRootMarker = "_OrrinRoot";
 constexpr std::string_view kThumbnailTag = "_OrrinThumbnail";
+// Leaves ids for clones and for what is built beside a file.
+constexpr uint32_t kObjectLimit = kObjectIDCount / 2;
 
 // "%1d.%2d" as sscanf reads it: blanks and a sign may stand before either number and count against no width
 // but the digits' own, so " 1. 2" has its place here too.
@@ -176,12 +178,13 @@ COrrinStream::~COrrinStream()
 
 void COrrinStream::RemoveAllRoots()
 {
+    m_kIsRoot.clear();
     m_kRoots.clear();
 }
 
 bool COrrinStream::AddRoot(CObject* object)
 {
-    if (!object || IsRoot(object))
+    if (!object || !m_kIsRoot.insert(object).second)
         return false;
     m_kRoots.emplace_back(object);
     return true;
@@ -194,7 +197,7 @@ CObject* COrrinStream::GetRoot(size_t index) const
 
 bool COrrinStream::IsRoot(const CObject* object) const
 {
-    return std::ranges::any_of(m_kRoots, [=](const Ref<CObject>& root) { return root == object; });
+    return m_kIsRoot.contains(object);
 }
 
 void COrrinStream::SetBaseDirectory(const std::string& path)
@@ -299,6 +302,12 @@ CObject* COrrinStream::ReadNextObject(bool& marked)
         return nullptr;
     // A class name is a C text: a zero byte ends it.
     const std::string name(className.substr(0, className.find('\0')));
+    // An object takes an id, and the search for a free one only ends where there is one.
+    if (g_uiObjectCount >= kObjectLimit)
+    {
+        m_kRecord.Fail(EFailure::TooLarge, start, name);
+        return nullptr;
+    }
     const CObjectFactory factory = CFactoryMap::Instance().Find(name);
     CObject* object = factory ? factory(*this) : nullptr;
     if (!object)
@@ -363,8 +372,15 @@ void COrrinStream::DropGraph()
 std::vector<CObject*> COrrinStream::ObjectsInSaveOrder()
 {
     RegisterRoots();
+    std::vector<CObject*> objects = std::move(m_kSaveList);
+    ClearSaveList();
+    return objects;
+}
+
+void COrrinStream::ClearSaveList()
+{
+    m_kSaveList.clear();
     m_kSaveID.clear();
-    return std::exchange(m_kSaveList, {});
 }
 
 bool COrrinStream::AppendToSaveList(CObject& object)
@@ -381,13 +397,23 @@ uint32_t COrrinStream::LinkID(const CObject* object) const
     return entry == m_kSaveID.end() ? 0 : entry->second;
 }
 
-bool COrrinStream::RegisterRoots()
+void COrrinStream::RegisterRoots()
 {
-    m_kSaveList.clear();
-    m_kSaveID.clear();
     for (const Ref<CObject>& root : m_kRoots)
         root->Register(*this);
-    return BufferBytes() + kHeader.size() <= kContainerBytesLimit || m_kRecord.Fail(EFailure::TooLarge);
+}
+
+// The bytes behind the header, or nothing and a failure where a file cannot be that large.
+std::optional<size_t> COrrinStream::PlanBuffer()
+{
+    m_kRecord.Clear();
+    RegisterRoots();
+    const uint64_t bytes = BufferBytes();
+    if (bytes + kHeader.size() <= kContainerBytesLimit)
+        return static_cast<size_t>(bytes);
+    ClearSaveList();
+    m_kRecord.Fail(EFailure::TooLarge);
+    return std::nullopt;
 }
 
 uint64_t COrrinStream::BufferBytes()
@@ -413,8 +439,7 @@ void COrrinStream::WriteObjects(CFieldWriter& writer)
         object->Save(*this);
     }
     m_pkWriter = nullptr;
-    m_kSaveList.clear();
-    m_kSaveID.clear();
+    ClearSaveList();
 }
 
 void COrrinStream::WriteObject(CObject& object)
@@ -426,11 +451,11 @@ void COrrinStream::WriteObject(CObject& object)
 
 bool COrrinStream::SaveBuffer(std::vector<std::byte>& out)
 {
-    m_kRecord.Clear();
     out.clear();
-    if (!RegisterRoots())
+    const std::optional<size_t> byteCount = PlanBuffer();
+    if (!byteCount)
         return false;
-    out.reserve(static_cast<size_t>(BufferBytes()));
+    out.reserve(*byteCount);
     const auto append = [&](std::span<const std::byte> bytes) {
         out.insert(out.end(), bytes.begin(), bytes.end());
         return true;
@@ -442,13 +467,15 @@ bool COrrinStream::SaveBuffer(std::vector<std::byte>& out)
 
 bool COrrinStream::SaveFile(const std::string& path)
 {
-    m_kRecord.Clear();
     SetBaseDirectory(path);
-    if (!RegisterRoots())
+    if (!PlanBuffer())
         return false;
     CSafeFile file;
     if (!file.Open(path))
+    {
+        ClearSaveList();
         return m_kRecord.Fail(EFailure::WriteError);
+    }
     CFieldWriter writer([&](std::span<const std::byte> bytes) { return file.Write(bytes); },
                         [this](const CObject* object) { return LinkID(object); });
     writer.WriteBytes(std::as_bytes(std::span(kHeader)));

@@ -9,9 +9,11 @@
 #include <cstddef>
 #include <map>
 #include <memory>
+#include <optional>
 #include <span>
 #include <string>
 #include <unordered_map>
+#include <unordered_set>
 #include <vector>
 
 namespace gw {
@@ -101,7 +103,9 @@ private:
     void LinkObjects();
     bool CheckGraph();
     void DropGraph();
-    bool RegisterRoots();
+    void RegisterRoots();
+    std::optional<size_t> PlanBuffer();
+    void ClearSaveList();
     uint64_t BufferBytes();
     void WriteObjects(CFieldWriter& writer);
     void SetBaseDirectory(const std::string& path);
@@ -109,6 +113,7 @@ private:
     CVersion m_kVersion;
     COrrinThumbnail m_kThumbnail;
     std::vector<Ref<CObject>> m_kRoots;
+    std::unordered_set<const CObject*> m_kIsRoot;
     std::map<uint32_t, CLinkRecord*> m_kLinkTable;
     std::vector<std::unique_ptr<CLinkRecord>> m_kRecords; // in file order
     std::vector<CObject*> m_kSaveList;

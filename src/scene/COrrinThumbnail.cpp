@@ -32,11 +32,11 @@ void COrrinThumbnail::Fields(CFieldArchive& archive)
     if (archive.IsReading() && present)
     {
         const int64_t stride = Stride();
-        // A size that is none, or a format that there is not: the bytes that follow cannot be told.
-        if (stride <= 0 || m_iHeight <= 0)
+        // A size below 0, or a format that there is not: the bytes that follow cannot be told.
+        if (stride < 0 || m_iHeight < 0)
             return archive.Refuse();
-        m_kPixels.resize(archive.Fitting(m_iHeight, static_cast<size_t>(stride)) *
-                         static_cast<size_t>(stride));
+        const size_t rowBytes = static_cast<size_t>(stride);
+        m_kPixels.resize(rowBytes == 0 ? 0 : archive.Fitting(m_iHeight, rowBytes) * rowBytes);
     }
     archive.Row("pixels", m_kPixels);
     archive.Unsigned("word A", m_uiWordA);

@@ -11,12 +11,20 @@ const CRTTI CSpatial::ms_kRTTI{"CSpatial", &CObject::ms_kRTTI};
 CSpatial::CSpatial() = default;
 CSpatial::~CSpatial() = default;
 
-// The parent stays null: a copy belongs to nobody.
+// Parent and render states stay away: a copy belongs to nobody, and cloning attaches the copies of the
+// states.
 CSpatial::CSpatial(const CSpatial& source)
     : CObject(source), m_kMatrix(source.m_kMatrix), m_kWorldMatrix(source.m_kWorldMatrix),
-      m_kBound(source.m_kBound), m_bStoredFlag(source.m_bStoredFlag), m_bForceCull(source.m_bForceCull),
-      m_pkRenderStates(source.m_pkRenderStates)
+      m_kBound(source.m_kBound), m_bStoredFlag(source.m_bStoredFlag), m_bForceCull(source.m_bForceCull)
 {
+}
+
+void CSpatial::CloneHeld(CCloneMap& map, CObject& copy)
+{
+    auto& states = static_cast<CSpatial&>(copy).m_pkRenderStates;
+    states.resize(m_pkRenderStates.size());
+    CObject::CloneHeld(map, copy);
+    std::erase(states, nullptr);
 }
 
 void CSpatial::Fields(CFieldArchive& archive)

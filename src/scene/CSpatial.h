@@ -62,6 +62,7 @@ public:
     bool m_bForceCull = false;           ///< the render walk skips this object with all below it
 
 protected:
+    void CloneHeld(CCloneMap& map, CObject& copy) override;
     void AppendBindOrder(std::vector<CObject*>& order) override;
     /// World matrix from the local one and the parent's.
     void UpdateWorldMatrix();
