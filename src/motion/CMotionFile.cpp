@@ -4,6 +4,7 @@
 #include "CLineWriter.h"
 #include "Paths.h"
 #include "TKBVHStream.h"
+#include "TKHTRStream.h"
 
 #include <algorithm>
 #include <iterator>
@@ -30,6 +31,7 @@ std::unique_ptr<CMotionFile> Make()
 }
 
 constexpr StreamRow kStreams[] = {
+    {".htr", Make<TKHTRStream>, true },
     {".bvh", Make<TKBVHStream>, false},
 };
 
@@ -38,6 +40,19 @@ const StreamRow* FindStream(const std::string& path)
     const auto fits = [&](const StreamRow& row) { return HasExtension(path, row.extension); };
     const auto found = std::ranges::find_if(kStreams, fits);
     return found == std::end(kStreams) ? nullptr : found;
+}
+
+// Sizes are bounded by those of the file or of the trees; a machine may still have less memory.
+template <class F>
+bool WithinMemory(CFailureRecord& record, F operation)
+{
+    try
+    {
+        return operation();
+    } catch (const std::bad_alloc&)
+    {
+        return record.Fail(EFailure::OutOfMemory);
+    }
 }
 
 // The first control of a class in a tree, or null.
@@ -57,20 +72,6 @@ CMotionFile::CMotionFile(const CMotionFile& trees)
 {
 }
 
-bool CMotionFile::LoadBy(CMotionFile& stream, const std::string& path)
-{
-    bool loaded = false;
-    try
-    {
-        loaded = stream.Load(path);
-    } catch (const std::bad_alloc&) // sizes are bounded by the file's; a machine may still have less
-    {
-        stream.m_kRecord.Fail(EFailure::OutOfMemory);
-    }
-    m_kRecord = stream.m_kRecord;
-    return loaded;
-}
-
 bool CMotionFile::Load(const std::string& path)
 {
     m_kRecord.Clear();
@@ -79,7 +80,9 @@ bool CMotionFile::Load(const std::string& path)
     if (const StreamRow* row = FindStream(path))
     {
         const auto stream = row->make();
-        if (!LoadBy(*stream, path))
+        const bool loaded = WithinMemory(stream->m_kRecord, [&] { return stream->Load(path); });
+        m_kRecord = stream->m_kRecord;
+        if (!loaded)
             return false;
         motionRoot = stream->motionRoot;
         fileVersion = stream->fileVersion;
@@ -92,10 +95,15 @@ bool CMotionFile::Load(const std::string& path)
     return true;
 }
 
-bool CMotionFile::Save(const std::string& path, float)
+bool CMotionFile::Save(const std::string& path, float frameScale)
 {
     m_kRecord.Clear();
-    return m_kRecord.Fail(path.empty() ? EFailure::NotFound : EFailure::UnknownFormat);
+    if (!HasExtension(path, ".htr"))
+        return m_kRecord.Fail(path.empty() ? EFailure::NotFound : EFailure::UnknownFormat);
+    TKHTRStream stream(*this);
+    const bool saved = WithinMemory(stream.m_kRecord, [&] { return stream.Save(path, frameScale); });
+    m_kRecord = stream.m_kRecord;
+    return saved;
 }
 
 float CMotionFile::GetLastFrame() const

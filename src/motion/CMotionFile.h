@@ -53,9 +53,6 @@ protected:
 
     CTextLines lines; ///< the text being read
     CFailureRecord m_kRecord;
-
-private:
-    bool LoadBy(CMotionFile& stream, const std::string& path);
 };
 
 /// Switches every control under a node on or off. Switched off, a track gives its node the rest pose.

@@ -1,0 +1,68 @@
+#pragma once
+
+#include "CFailure.h"
+
+#include <cstddef>
+#include <set>
+#include <span>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+class CTextLines;
+struct TKHTRFile;
+struct TKHTRSegment;
+
+/// Reads an HTR file into records. A line that begins with "[" starts a section; sections come in any order,
+/// but the header's count of segments says how many lines of the hierarchy count, and values of a segment
+/// that is not there yet are lost. Unknown sections are skipped.
+class CHTRReader
+{
+public:
+    CHTRReader(CTextLines& lines, TKHTRFile& file, CFailureRecord& record)
+        : m_kLines(lines), m_kFile(file), m_kRecord(record)
+    {
+    }
+
+    /// Reads all lines. False, with the reason in the record, for a section that is no good, for a file
+    /// without a hierarchy and for one that asks for more frames than its size justifies.
+    bool Read();
+
+private:
+    using Handler = bool (CHTRReader::*)(std::string_view section);
+    struct HandlerRow
+    {
+        std::string_view section;
+        Handler read;
+    };
+    static const HandlerRow kHandlers[];
+
+    bool ReadSection(std::string_view section);
+    bool ReadHeader(std::string_view section);
+    bool ReadHierarchy(std::string_view section);
+    bool ReadBasePosition(std::string_view section);
+    bool ReadSegment(std::string_view section);
+
+    bool NextSectionLine(std::string_view& line);
+    bool ReadKey(std::string_view key, std::string_view rest);
+    bool AddSegment(std::string_view line);
+    void LinkSegments();
+    bool IndexSegments();
+    bool ReadBaseLine(std::string_view line);
+    bool ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row);
+    bool ReadNumbers(std::string_view text, std::span<float, 7> numbers, size_t& count);
+    bool CheckFile();
+    void WarnOfMissingRows();
+
+    bool Fail(EFailure reason, std::string_view name);
+    void Warn(EFailure reason, std::string_view name);
+
+    CTextLines& m_kLines;
+    TKHTRFile& m_kFile;
+    CFailureRecord& m_kRecord;
+    std::set<std::string, std::less<>> m_kSegmentSections; // "[name]" of each segment that has a parent
+    size_t m_uiFramesLine = 0;                             // of the key "NumFrames"
+};
+
+} // namespace gw

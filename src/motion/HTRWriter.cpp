@@ -1,0 +1,251 @@
+// The writing half of TKHTRStream.
+//
+// A file lists all rows of one segment before those of the next. Where a node's local matrix follows from its
+// own track alone, segments are sampled one after the other and go straight into the file, so that nothing is
+// kept. In any other tree all nodes must be posed for a frame at once, and the rows wait for their turn.
+
+#include "BoneMeshQueries.h"
+#include "CLineWriter.h"
+#include "CMotionSampler.h"
+#include "Euler.h"
+#include "Skeleton.h"
+#include "TKHTRFile.h"
+#include "TKHTRStream.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace gw {
+
+namespace {
+
+constexpr float kFrameLimit = 1 << 24;             // frame numbers beyond are no whole floats
+constexpr size_t kRowBytesLimit = size_t{1} << 31; // of rows that wait
+constexpr size_t kNoNode = std::numeric_limits<size_t>::max();
+
+struct Row
+{
+    Vec3 translation = kVec3Zero;
+    Vec3 degrees = kVec3Zero;
+    float scale = 1.0f;
+};
+
+Row RowOf(const CNode& node, const TKHTRSegment& segment)
+{
+    const Mat4& local = node.m_kMatrix;
+    Row row;
+    if (!node.GetParent())
+        row.translation = local.Translation() - segment.baseTranslation;
+    row.degrees = Mat3ToEulerDegrees(NormalizedRows(local)) - segment.baseRotation;
+    row.scale = static_cast<float>(Vec3Length(local.Row(0)));
+    return row;
+}
+
+void AddSegments(const CNode& node, std::string_view parentName, TKHTRFile& file)
+{
+    TKHTRSegment& segment = *file.segments.emplace_back(std::make_unique<TKHTRSegment>());
+    segment.name = node.NameView();
+    segment.parentName = parentName;
+    segment.baseTranslation = node.m_kMatrix.Translation();
+    segment.baseRotation = Mat3ToEulerDegrees(NormalizedRows(node.m_kMatrix));
+    segment.boneLength = NodeBoneLength(node);
+    for (size_t i = 0; i < node.GetChildCount(); ++i)
+    {
+        if (const CNode* child = RecordCast<CNode>(node.ChildAt(i)))
+            AddSegments(*child, segment.name, file);
+    }
+}
+
+// For each segment the node of its name in the animated tree, or kNoNode. Equal names go in order.
+std::vector<size_t> NodesOfSegments(const TKHTRFile& file, const std::vector<CNode*>& nodes)
+{
+    std::unordered_map<std::string_view, std::vector<size_t>> nodesOfName;
+    for (size_t i = nodes.size(); i-- > 0;)
+        nodesOfName[nodes[i]->NameView()].push_back(i);
+    std::vector<size_t> found;
+    for (const auto& segment : file.segments)
+    {
+        std::vector<size_t>& left = nodesOfName[segment->name];
+        found.push_back(left.empty() ? kNoNode : left.back());
+        if (!left.empty())
+            left.pop_back();
+    }
+    return found;
+}
+
+/// The rows of all segments, made when they are asked for or, where they depend on each other, beforehand.
+class CRows
+{
+public:
+    CRows(const TKHTRFile& file, CNode& motion, std::vector<float> times)
+        : m_kFile(file), m_kTimes(std::move(times)), m_kSampler(motion),
+          m_kNodeOfSegment(NodesOfSegments(file, m_kSampler.Nodes()))
+    {
+    }
+
+    /// False where the rows that must wait would take too much memory.
+    bool Prepare()
+    {
+        if (m_kSampler.PosesNodes())
+            return true;
+        if (m_kTimes.size() > kRowBytesLimit / sizeof(Row) / m_kFile.segments.size())
+            return false;
+        m_kWaiting.resize(m_kTimes.size() * m_kFile.segments.size());
+        for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
+        {
+            m_kSampler.PoseTree(m_kTimes[frame]);
+            for (size_t segment = 0; segment < m_kFile.segments.size(); ++segment)
+                m_kWaiting[segment * m_kTimes.size() + frame] = PosedRow(segment);
+        }
+        return true;
+    }
+
+    Row At(size_t segment, size_t frame)
+    {
+        if (!m_kWaiting.empty())
+            return m_kWaiting[segment * m_kTimes.size() + frame];
+        if (m_kNodeOfSegment[segment] != kNoNode)
+            m_kSampler.PoseNode(m_kNodeOfSegment[segment], m_kTimes[frame]);
+        return PosedRow(segment);
+    }
+
+private:
+    Row PosedRow(size_t segment) const
+    {
+        const size_t node = m_kNodeOfSegment[segment];
+        return node == kNoNode ? Row() : RowOf(*m_kSampler.Nodes()[node], *m_kFile.segments[segment]);
+    }
+
+    const TKHTRFile& m_kFile;
+    std::vector<float> m_kTimes;
+    CMotionSampler m_kSampler;
+    std::vector<size_t> m_kNodeOfSegment;
+    std::vector<Row> m_kWaiting; // segment by segment
+};
+
+void Write(CLineWriter& out, const std::string& field)
+{
+    out.Text(field);
+}
+
+void Write(CLineWriter& out, char field)
+{
+    out.Text({&field, 1});
+}
+
+void Write(CLineWriter& out, int field)
+{
+    out.Int(field);
+}
+
+void Write(CLineWriter& out, float field)
+{
+    out.Number(field);
+}
+
+void WriteVector(CLineWriter& out, const Vec3& v)
+{
+    out.Text(" ").Number(v.x).Text(" ").Number(v.y).Text(" ").Number(v.z);
+}
+
+void WriteHeader(CLineWriter& out, const TKHTRFile& file)
+{
+    out.Line("[Header]");
+    for (const CHTRKey& key : kHTRKeys)
+    {
+        out.Text(key.name).Text(" ");
+        std::visit([&](auto field) { Write(out, file.*field); }, key.field);
+        out.EndLine();
+    }
+}
+
+void WriteSegments(CLineWriter& out, const TKHTRFile& file)
+{
+    out.Line("[SegmentNames&Hierarchy]");
+    out.Line("#CHILD\tPARENT");
+    for (const auto& segment : file.segments)
+        out.Text(segment->name).Text(" ").Line(segment->parentName);
+    out.Line("[BasePosition]");
+    out.Line("#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength");
+    for (const auto& segment : file.segments)
+    {
+        out.Text(segment->name);
+        WriteVector(out, segment->baseTranslation);
+        WriteVector(out, segment->baseRotation);
+        out.Text(" ").Number(segment->boneLength).EndLine();
+    }
+}
+
+void WriteRows(CLineWriter& out, const TKHTRFile& file, CRows& rows)
+{
+    out.Line("#Beginning of Data. Separated by tabs");
+    for (size_t segment = 0; segment < file.segments.size(); ++segment)
+    {
+        out.Text("[").Text(file.segments[segment]->name).Line("]");
+        out.Line("#Fr\tTx\tTy\tTz\tRx\tRy\tRz\tSF");
+        for (int frame = 0; frame < file.numFrames; ++frame)
+        {
+            const Row row = rows.At(segment, static_cast<size_t>(frame));
+            out.Int(frame + 1);
+            WriteVector(out, row.translation);
+            WriteVector(out, row.degrees);
+            out.Text(" ").Number(row.scale).EndLine();
+        }
+    }
+}
+
+} // namespace
+
+bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
+{
+    // One rounding: of the exact product to 32 bits.
+    const auto frames =
+        static_cast<float>(static_cast<double>(GetKeyCount()) * static_cast<double>(frameScale));
+    const double rate = 1.0 / static_cast<double>(GetFrequency());
+    if (!(std::fabs(frames) <= kFrameLimit))
+        return m_kRecord.Fail(EFailure::TooLarge);
+    file.fileType = "htr";
+    file.dataType = "HTRS";
+    file.fileVersion = fileVersion;
+    file.numSegments = static_cast<int>(NodesOf(*motionRoot).size());
+    file.numFrames = static_cast<int>(frames);
+    file.dataFrameRate = std::fabs(rate) <= std::numeric_limits<int>::max() ? static_cast<int>(rate) : 0;
+    file.eulerOrder = "ZYX";
+    file.calibrationUnits = "mm";
+    file.rotationUnits = "Degrees";
+    file.gravityAxis = 'Y';
+    file.boneLengthAxis = 'Y';
+    file.scaleFactor = 1.0f;
+    return true;
+}
+
+bool TKHTRStream::Save(const std::string& path, float frameScale)
+{
+    m_kRecord.Clear();
+    if (!restRoot || !motionRoot)
+        return m_kRecord.Fail(EFailure::NoRoot);
+    TKHTRFile file;
+    if (!FillHeader(file, frameScale))
+        return false;
+    AddSegments(*restRoot, "GLOBAL", file);
+    SwitchControls(*motionRoot, true);
+
+    const float frequency = GetFrequency();
+    std::vector<float> times;
+    for (int frame = 0; frame < file.numFrames; ++frame)
+        times.push_back(TimeOfFrame(frame, frequency, frameScale));
+    CRows rows(file, *motionRoot, std::move(times));
+    const bool written = WriteLines(path, [&](CLineWriter& out) {
+        if (!rows.Prepare())
+            return m_kRecord.Fail(EFailure::TooLarge);
+        WriteHeader(out, file);
+        WriteSegments(out, file);
+        WriteRows(out, file, rows);
+        return true;
+    });
+    motionRoot->UpdateScene(0.0f, true);
+    return written;
+}
+
+} // namespace gw

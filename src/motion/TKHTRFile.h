@@ -1,0 +1,84 @@
+#pragma once
+
+#include "Vec3.h"
+
+#include <cstddef>
+#include <memory>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <variant>
+#include <vector>
+
+namespace gw {
+
+/// A segment with its base pose and its rows. Angles are degrees; a row is a delta on the base pose.
+struct TKHTRSegment
+{
+    std::string parentName;
+    std::string name;
+    Vec3 baseTranslation = kVec3Zero;
+    Vec3 baseRotation = kVec3Zero;
+    float boneLength = 0.0f;
+    std::vector<TKHTRSegment*> children; ///< owned by the file
+
+    // One entry for each data row.
+    std::vector<Vec3> translations;
+    std::vector<Vec3> rotations;
+    std::vector<float> scales;
+
+    size_t line = 0; ///< where the hierarchy names it
+};
+
+/// The parse context, with the fields of the header.
+struct TKHTRFile
+{
+    std::string fileType;
+    std::string dataType;
+    std::string eulerOrder;
+    std::string calibrationUnits;
+    std::string rotationUnits;
+    char gravityAxis = '\0';
+    char boneLengthAxis = '\0';
+    int fileVersion = 1; ///< what a file without the key hands on
+    int numSegments = 0;
+    int numFrames = 0;
+    int dataFrameRate = 0;
+    float scaleFactor = 0.0f;
+
+    TKHTRSegment* root = nullptr; ///< the record "GLOBAL" above the hierarchy, or null before there is one
+    std::vector<std::unique_ptr<TKHTRSegment>> segments; ///< all records
+    std::unordered_map<std::string_view, TKHTRSegment*>
+        segmentOfName; ///< those under the root, the first of a name
+
+    /// The file's root segment, or null.
+    TKHTRSegment* FirstRoot() const { return root && !root->children.empty() ? root->children[0] : nullptr; }
+};
+
+/// A key of the header and the field that it stands for.
+struct CHTRKey
+{
+    using Field =
+        std::variant<std::string TKHTRFile::*, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
+
+    std::string_view name;
+    Field field;
+};
+
+/// All keys, in the order of writing.
+inline constexpr CHTRKey kHTRKeys[] = {
+    {"FileType",            &TKHTRFile::fileType        },
+    {"DataType",            &TKHTRFile::dataType        },
+    {"FileVersion",         &TKHTRFile::fileVersion     },
+    {"NumSegments",         &TKHTRFile::numSegments     },
+    {"NumFrames",           &TKHTRFile::numFrames       },
+    {"DataFrameRate",       &TKHTRFile::dataFrameRate   },
+    {"EulerRotationOrder",  &TKHTRFile::eulerOrder      },
+    {"CalibrationUnits",    &TKHTRFile::calibrationUnits},
+    {"RotationUnits",       &TKHTRFile::rotationUnits   },
+    {"GlobalAxisofGravity", &TKHTRFile::gravityAxis     },
+    {"BoneLengthAxis",      &TKHTRFile::boneLengthAxis  },
+    {"ScaleFactor",         &TKHTRFile::scaleFactor     },
+};
+
+} // namespace gw

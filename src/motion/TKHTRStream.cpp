@@ -1,0 +1,125 @@
+#include "TKHTRStream.h"
+
+#include "Angles.h"
+#include "AxisRotation.h"
+#include "CBoneMesh.h"
+#include "CHTRReader.h"
+#include "CKeyframeControl.h"
+#include "Euler.h"
+#include "MotionNode.h"
+#include "TKHTRFile.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+// The axes of a rotation order (0 X, 1 Y, 2 Z) in the order of its letters, which is the order in which their
+// rotations are multiplied in from the left. None for an unknown order: it drops the rotation.
+std::vector<int> AxesOf(std::string_view order)
+{
+    if (!std::ranges::is_permutation(order, std::string_view("XYZ")))
+        return {};
+    std::vector<int> axes;
+    for (const char letter : order)
+        axes.push_back(letter - 'X');
+    return axes;
+}
+
+// EulerToMat3(order, degrees) · base, for the inner loop.
+Mat3 RotatedBase(const std::vector<int>& axes, const Vec3& degrees, const Mat3& base)
+{
+    const float angles[] = {degrees.x, degrees.y, degrees.z};
+    Mat3 m = base;
+    for (const int axis : axes)
+        RotateRows(m, axis, angles[axis] * kDegreesToRadians);
+    return m;
+}
+
+Mat4 BaseMatrix(const TKHTRFile& file, const TKHTRSegment& segment)
+{
+    return Mat4Compose(EulerToMat3(file.eulerOrder, segment.baseRotation), segment.baseTranslation);
+}
+
+void AppendKeys(CKeyframeControl& track, const TKHTRSegment& segment, const std::vector<int>& axes,
+                const Mat3& base)
+{
+    const size_t count = segment.translations.size();
+    track.m_kRotationKeys.reserve(count);
+    track.m_kPositionKeys.reserve(count);
+    track.m_kScaleKeys.reserve(count);
+    for (size_t i = 0; i < count; ++i)
+    {
+        track.m_kRotationKeys.push_back(QuatFromMat3(RotatedBase(axes, segment.rotations[i], base)));
+        track.m_kPositionKeys.push_back(segment.baseTranslation + segment.translations[i]);
+        track.m_kScaleKeys.push_back(kVec3One * segment.scales[i]);
+    }
+}
+
+} // namespace
+
+bool TKHTRStream::Load(const std::string& path)
+{
+    m_kRecord.Clear();
+    if (!ReadLines(path))
+        return false;
+    TKHTRFile file;
+    if (!CHTRReader(lines, file, m_kRecord).Read())
+        return false;
+    fileVersion = file.fileVersion;
+    return BuildRestTree(file) && BuildAnimatedTree(file);
+}
+
+bool TKHTRStream::BuildRestTree(const TKHTRFile& file)
+{
+    const TKHTRSegment* root = file.FirstRoot();
+    if (!root)
+        return false;
+    restRoot = new CNode;
+    BuildRestNode(file, *root, *restRoot);
+    return true;
+}
+
+void TKHTRStream::BuildRestNode(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
+{
+    node.SetName(segment.name.c_str());
+    node.m_kMatrix = BaseMatrix(file, segment);
+    AddBoneShape(file, segment, node);
+    for (const TKHTRSegment* child : segment.children)
+        BuildRestNode(file, *child, AttachNode(node));
+}
+
+bool TKHTRStream::BuildAnimatedTree(const TKHTRFile& file)
+{
+    TKHTRSegment* root = file.FirstRoot();
+    if (!root)
+        return false;
+    motionRoot = new CNode;
+    BuildAnimatedNode(file, *root, *motionRoot);
+    return true;
+}
+
+void TKHTRStream::BuildAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node)
+{
+    node.SetName(segment.name.c_str());
+    const float frequency = 1.0f / static_cast<float>(file.dataFrameRate);
+    CKeyframeControl& track = AttachTrack(node, file.numFrames, frequency, BaseMatrix(file, segment));
+    AppendKeys(track, segment, AxesOf(file.eulerOrder), EulerToMat3(file.eulerOrder, segment.baseRotation));
+    // Rows are not needed again, and a large file's keys take their place.
+    segment.translations = {};
+    segment.rotations = {};
+    segment.scales = {};
+    AddBoneShape(file, segment, node);
+    for (TKHTRSegment* child : segment.children)
+        BuildAnimatedNode(file, *child, AttachNode(node));
+}
+
+void TKHTRStream::AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
+{
+    CBoneMesh& mesh = AttachBone(node, segment.name, segment.children.size(), segment.boneLength);
+    mesh.m_kMatrix = Mat4Compose(UpAxisMatrix(file.boneLengthAxis), kVec3Zero);
+}
+
+} // namespace gw
