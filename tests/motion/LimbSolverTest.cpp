@@ -1,0 +1,114 @@
+#include "Angles.h"
+#include "CLegSolver.h"
+
+#include <cmath>
+#include <gtest/gtest.h>
+#include <random>
+
+namespace gw {
+namespace {
+
+constexpr float kUpper = 360.0f;
+constexpr float kLower = 345.0f;
+
+struct Solved
+{
+    bool ok;
+    Vec3 knee;
+    Vec3 ankle;
+    CLegSolver::Pose pose;
+};
+
+// Solves one leg for a goal in the solver's frame and rebuilds where knee and ankle come to stand.
+Solved Reach(const Vec3& goal, Vec3 hint)
+{
+    CLegSolver solver(1);
+    solver.SetLimb(0, {0, kUpper, 0}, {0, kLower, 0}, kVec3UnitZ, kVec3UnitX);
+    Mat4 matrix = kMat4Identity;
+    matrix.SetTranslation(goal);
+    Solved out{};
+    out.ok = solver.Solve(0, hint, matrix, out.pose);
+    const Mat4 hip = Mat4Compose(out.pose.hip, kVec3Zero);
+    out.knee = TransformCoord({0, 0, -kUpper}, hip);
+    const Vec3 shank = TransformCoord({0, 0, -kLower}, Mat4Compose(out.pose.knee, kVec3Zero));
+    out.ankle = TransformCoord(shank + Vec3{0, 0, -kUpper}, hip);
+    return out;
+}
+
+Vec3 AcrossGoal(const Vec3& point, const Vec3& goal)
+{
+    const Vec3 n = Vec3Normalized(goal);
+    return Vec3Normalized(point - n * static_cast<float>(Vec3Dot(point, n)));
+}
+
+bool IsRotation(const Mat3& m)
+{
+    const Mat3 product = m * Mat3Transpose(m);
+    for (int i = 0; i < 9; ++i)
+    {
+        if (std::fabs(product.m[i] - kMat3Identity.m[i]) > 1e-4f)
+            return false;
+    }
+    return Vec3Dot(Vec3Cross(m.Row(0), m.Row(1)), m.Row(2)) > 0.0;
+}
+
+TEST(CLegSolver, ReachesRandomGoalsWithTheKneeTowardTheHint)
+{
+    std::mt19937 random(7);
+    std::uniform_real_distribution<float> unit(-1.0f, 1.0f);
+    int solved = 0;
+    while (solved < 300)
+    {
+        const Vec3 goal = Vec3{unit(random), unit(random), unit(random)} * (kUpper + kLower);
+        const Vec3 hint = Vec3{unit(random), unit(random), unit(random)} * 800.0f;
+        const double distance = Vec3Length(goal);
+        if (distance > 0.999 * (kUpper + kLower) || distance < 30.0)
+            continue;
+        ++solved;
+        SCOPED_TRACE(testing::Message() << goal.x << ' ' << goal.y << ' ' << goal.z);
+        const Solved leg = Reach(goal, hint);
+        ASSERT_TRUE(leg.ok);
+        EXPECT_LT(Vec3Length(leg.ankle - goal), 0.05);
+        EXPECT_NEAR(Vec3Length(leg.knee), kUpper, 0.05);
+        EXPECT_NEAR(Vec3Length(leg.ankle - leg.knee), kLower, 0.05);
+        EXPECT_TRUE(IsRotation(leg.pose.hip));
+        EXPECT_TRUE(IsRotation(leg.pose.foot));
+        if (Vec3Length(AcrossGoal(leg.knee, goal)) > 0.0)
+        {
+            EXPECT_GT(Vec3Dot(AcrossGoal(leg.knee, goal), AcrossGoal(hint, goal)), 0.999);
+        }
+    }
+}
+
+TEST(CLegSolver, GoalsAtTheLimits)
+{
+    const float full = kUpper + kLower;
+    const struct
+    {
+        const char* what;
+        Vec3 goal;
+        bool ok;
+        double reach; // how far from the hip the ankle comes to stand
+    } rows[] = {
+        {"far out of reach is drawn in to just short of straight", {0, 0, -2000}, true,  full / 1.00001},
+        {"exactly at the full length",                             {0, 0, -full}, true,  full          },
+        {"exactly at the full length, sideways",                   {full, 0, 0},  true,  full          },
+        {"straight along the hinge's axis",                        {0, 0, 500},   true,  500           },
+        {"nearer than the segments can fold",                      {0, 0, -10},   false, 0             },
+        {"at the hip itself",                                      {0, 0, 0},     false, 0             },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const Solved leg = Reach(row.goal, {500, 100, -300});
+        EXPECT_EQ(leg.ok, row.ok);
+        if (!row.ok || !leg.ok)
+            continue;
+        EXPECT_TRUE(IsRotation(leg.pose.hip));
+        EXPECT_NEAR(Vec3Length(leg.ankle), row.reach, 0.05);
+        EXPECT_LT(Vec3Length(leg.ankle - Vec3Normalized(row.goal) * static_cast<float>(row.reach)), 0.05);
+    }
+}
+
+} // namespace
+} // namespace gw
