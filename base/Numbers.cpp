@@ -54,50 +54,22 @@ const char* SkipPlus(const char* text, const char* end)
     return end - text > 1 && text[0] == '+' && text[1] != '-' ? text + 1 : text;
 }
 
-// The digits at the front of eight bytes, at most eight of them, without a branch: digits of other lengths
-// follow each other in a row, and a loop's end that cannot be foretold costs more than the whole number.
-struct CDigits
-{
-    uint64_t number;
-    int count;
-};
-
-CDigits FrontDigits(const char* text)
-{
-    static_assert(std::endian::native == std::endian::little, "the first character must be the lowest byte");
-    uint64_t bytes;
-    std::memcpy(&bytes, text, sizeof bytes);
-    bytes ^= 0x3030303030303030; // '0' to '9' become 0 to 9, and nothing else does
-    // The high bit marks what is above 9. A carry only reaches bytes behind the first of these.
-    const uint64_t others = ((bytes + 0x7676767676767676) | bytes) & 0x8080808080808080;
-    const int count = std::countr_zero(others) / 8;
-    const int half = 32 - 4 * count;
-    bytes = bytes << half << half; // zeros before the digits, and out with what follows them
-    bytes = bytes * 10 + (bytes >> 8);
-    constexpr uint64_t kEverySecondPair = 0x000000ff000000ff;
-    const uint64_t high = (bytes & kEverySecondPair) * (uint64_t{1000000} << 32 | 100);
-    const uint64_t low = (bytes >> 16 & kEverySecondPair) * (uint64_t{10000} << 32 | 1);
-    return {(high + low) >> 32, count};
-}
-
 // Adds the digits at a place to a number. It may wrap; the caller counts the digits.
 inline const char* TakeDigits(const char* text, const char* end, uint64_t& number)
 {
-    constexpr uint64_t kPowers[] = {1, 10, 100, 1000, 10000, 100000, 1000000, 10000000, 100000000};
-    while (end - text >= 8)
+    for (; text != end; ++text)
     {
-        const CDigits digits = FrontDigits(text);
-        number = number * kPowers[digits.count] + digits.number;
-        text += digits.count;
-        if (digits.count < 8)
-            return text;
+        const unsigned digit = static_cast<unsigned char>(*text) - unsigned{'0'};
+        if (digit > 9)
+            break;
+        number = number * 10 + digit;
     }
-    for (; text != end && IsDigit(*text); ++text)
-        number = number * 10 + static_cast<uint64_t>(*text - '0');
     return text;
 }
 
-// The fast case. Answers the end of the number, or null where from_chars has to look.
+// The fast case. Answers the end of the number, or null where from_chars has to look. One digit at a time is
+// the fastest: the next number can only begin where this one ends, and the processor foresees the branches of
+// this loop, so that it works on both. (Eight digits at once without a branch: 17 ns a number; this: 10.)
 inline const char* ReadPlain(const char* text, const char* end, double& value)
 {
     const bool negative = text != end && *text == '-';
@@ -113,10 +85,12 @@ inline const char* ReadPlain(const char* text, const char* end, double& value)
         decimals = next - point;
         count += decimals;
     }
-    const bool goesOn = next != end && ((*next | 0x20) == 'e' || (*next | 0x20) == 'x');
-    if (goesOn || count == 0 || count > kPlainDigits || number > kExactMantissa)
+    if (count == 0 || count > kPlainDigits || number > kExactMantissa)
+        return nullptr;
+    if (next != end && ((*next | 0x20) == 'e' || (*next | 0x20) == 'x'))
         return nullptr;
     const double magnitude = static_cast<double>(static_cast<int64_t>(number)) / kPowersOfTen[decimals];
+    // No branch: signs come in no order.
     value = std::bit_cast<double>(std::bit_cast<uint64_t>(magnitude) | uint64_t{negative} << 63);
     return next;
 }
@@ -131,8 +105,7 @@ int64_t ReadExponent(std::string_view text)
     return exponent;
 }
 
-// from_chars does not say on which side a number leaves the range; the place of its first digit other than 0
-// does.
+// from_chars does not say on which side a number leaves the range: the place of its first digit not 0 does.
 bool IsHuge(std::string_view number, bool hex)
 {
     const size_t mark = std::min(number.find_first_of(hex ? "pP" : "eE"), number.size());
@@ -143,8 +116,7 @@ bool IsHuge(std::string_view number, bool hex)
     return (point - first) * (hex ? 4 : 1) + exponent > 0;
 }
 
-// from_chars reads hexadecimal digits without their prefix, but takes another sign, "inf" and "nan" there as
-// well.
+// from_chars wants hexadecimal digits without their prefix; there it would also take a sign, "inf" and "nan".
 bool StartsHex(const char* text, const char* end)
 {
     if (end - text < 3 || text[0] != '0' || (text[1] | 0x20) != 'x')
@@ -161,11 +133,9 @@ const char* EndOfHex(const char* text, const char* end)
     return std::search(text, std::find_if_not(text, end, belongs), kTwoSigns.begin(), kTwoSigns.end());
 }
 
-// A number without blanks before it, as strtod reads it. Answers its end, or null where none stands.
-const char* ReadNumber(const char* text, const char* end, double& value)
+// A number of any form without blanks before it, as strtod reads it. Answers its end, or null for no number.
+const char* ReadAny(const char* text, const char* end, double& value)
 {
-    if (const char* next = ReadPlain(text, end, value))
-        return next;
     text = SkipPlus(text, end);
     const bool negative = text != end && *text == '-';
     const bool hex = StartsHex(text + negative, end);
@@ -199,12 +169,11 @@ bool IsCutShort(const char* text, const char* next, const char* end, double valu
     return (*next | 0x20) == 'x' && *first == '0' && next - first == 1 && !pointFollows;
 }
 
-// A number as sscanf reads it, narrowed. Null where none stands.
-const char* ReadNarrowed(const char* text, const char* end, float& value)
+// The same as sscanf reads it, narrowed.
+const char* ReadAnyNarrowed(const char* text, const char* end, float& value)
 {
-    text = SkipBlanks(text, end);
     double wide = 0.0;
-    const char* const next = ReadNumber(text, end, wide);
+    const char* const next = ReadAny(text, end, wide);
     if (!next || IsCutShort(text, next, end, wide))
         return nullptr;
     value = static_cast<float>(wide);
@@ -218,11 +187,24 @@ ENumber KindOfWhole(double value, const char* next, const char* end)
     return SkipBlanks(next, end) == end ? ENumber::Whole : ENumber::Stuck;
 }
 
-ENumber KindInRow(double value, const char* next, const char* end)
+ENumber KindInRow(const char* next, const char* end)
 {
-    if (!std::isfinite(value))
-        return ENumber::Unusual;
-    return next == end || *next == ',' || IsBlank(*next) ? ENumber::Whole : ENumber::Stuck;
+    return next == end || *next == ' ' || *next == ',' || IsBlank(*next) ? ENumber::Whole : ENumber::Stuck;
+}
+
+// Apart from the fast case, whose registers it would take.
+[[gnu::noinline]] float ReadOddFloat(const char* text, const char* end, const char*& next, ENumber& kind)
+{
+    float value = 0.0f;
+    next = ReadAnyNarrowed(SkipBlanks(text, end), end, value);
+    if (!next)
+    {
+        next = text;
+        kind = ENumber::None;
+        return 0.0f;
+    }
+    kind = std::isfinite(value) ? KindInRow(next, end) : ENumber::Unusual;
+    return value;
 }
 
 // The numbers below 1000 as text, from the left, for what stands before the point and in threes behind it.
@@ -287,7 +269,7 @@ double ParseDouble(std::string_view text, ENumber& kind)
 {
     const char* const end = text.data() + text.size();
     double value = 0.0;
-    const char* const next = ReadNumber(SkipBlanks(text.data(), end), end, value);
+    const char* const next = ReadAny(SkipBlanks(text.data(), end), end, value);
     kind = next ? KindOfWhole(value, next, end) : ENumber::None;
     return value;
 }
@@ -301,7 +283,7 @@ bool ScanFloat(std::string_view text, float& value)
 bool ScanFloat(std::string_view text, float& value, ENumber& kind)
 {
     const char* const end = text.data() + text.size();
-    const char* const next = ReadNarrowed(text.data(), end, value);
+    const char* const next = ReadAnyNarrowed(SkipBlanks(text.data(), end), end, value);
     kind = next ? KindOfWhole(static_cast<double>(value), next, end) : ENumber::None;
     return next != nullptr;
 }
@@ -326,17 +308,12 @@ bool ScanInt(std::string_view text, int32_t& value)
 float ReadFloat(const char* text, const char* end, const char*& next, ENumber& kind)
 {
     double plain;
-    if (const char* const plainEnd = ReadPlain(text, end, plain))
-    {
-        next = plainEnd;
-        kind = KindInRow(plain, next, end);
-        return static_cast<float>(plain);
-    }
-    float value = 0.0f;
-    const char* const numberEnd = ReadNarrowed(text, end, value);
-    next = numberEnd ? numberEnd : text;
-    kind = numberEnd ? KindInRow(static_cast<double>(value), numberEnd, end) : ENumber::None;
-    return value;
+    const char* const plainEnd = ReadPlain(text, end, plain);
+    if (!plainEnd)
+        return ReadOddFloat(text, end, next, kind);
+    next = plainEnd;
+    kind = KindInRow(plainEnd, end);
+    return static_cast<float>(plain);
 }
 
 char* WriteFixed6(char* out, float value)
