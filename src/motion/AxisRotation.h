@@ -3,13 +3,14 @@
 #include "Mat3.h"
 
 #include <cmath>
+#include <cstddef>
 
 namespace gw {
 
 /// m := R · m for the rotation R about one axis (0 X, 1 Y, 2 Z) by an angle in radians. Such a rotation
 /// changes two rows of m only, so that this takes a third of a matrix product; the result is that of
 /// Mat3FromAxisAngle and Mat3Multiply within rounding.
-inline void RotateRows(Mat3& m, int axis, float radians)
+inline void RotateRows(Mat3& m, size_t axis, float radians)
 {
     const float c = std::cos(radians);
     const float s = std::sin(radians);

@@ -15,9 +15,6 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kNameLimit = 255;
-constexpr size_t kLongestQuote = 80; // of a word in the failure record
-
 // A finite number, or None and Unusual for what is none.
 float TakeNumber(std::string_view& rest, std::string_view& token, ENumber& kind)
 {
@@ -37,7 +34,7 @@ bool IsNoNumber(ENumber kind)
 
 bool CBVHHierarchyReader::Fail(EFailure reason, std::string_view name)
 {
-    return m_kRecord.Fail(reason, m_kLines.LineNumber(), std::string(name.substr(0, kLongestQuote)));
+    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
 }
 
 bool CBVHHierarchyReader::Read()
@@ -140,8 +137,7 @@ bool CBVHHierarchyReader::ReadOffset(TKBVHJoint& joint, std::string_view rest)
         if (IsNoNumber(kind))
             return Fail(EFailure::BadNumber, token);
         if (kind == ENumber::Stuck)
-            m_kRecord.Warn(EFailure::StuckNumber, m_kLines.LineNumber(),
-                           std::string(token.substr(0, kLongestQuote)));
+            m_kRecord.Warn(EFailure::StuckNumber, m_kLines.LineNumber(), Quote(token));
     }
     return true;
 }
@@ -163,8 +159,7 @@ bool CBVHHierarchyReader::ReadChannels(TKBVHJoint& joint, std::string_view rest)
         if (known != std::end(kChannelNames))
             joint.channels.push_back(static_cast<int>(known - std::begin(kChannelNames)));
         else
-            m_kRecord.Warn(EFailure::UnknownChannel, m_kLines.LineNumber(),
-                           std::string(channel.substr(0, kLongestQuote)));
+            m_kRecord.Warn(EFailure::UnknownChannel, m_kLines.LineNumber(), Quote(channel));
     }
     return true;
 }

@@ -18,11 +18,9 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kBytesPerValue = 2;                // a digit and a separator
-constexpr size_t kForgetInterval = size_t{8} << 20; // pages are given back in pieces of this size
-constexpr size_t kLongestQuote = 80;                // of a token in the failure record
-constexpr int kProbeRows = 8;                       // rows that may tell that positions repeat the offsets
-constexpr double kRepeatTolerance = 0.01;           // of an offset's length
+constexpr size_t kBytesPerValue = 2;      // a digit and a separator
+constexpr int kProbeRows = 8;             // rows that may tell that positions repeat the offsets
+constexpr double kRepeatTolerance = 0.01; // of an offset's length
 
 bool IsSeparator(char c)
 {
@@ -41,11 +39,6 @@ const char* SkipSeparators(const char* text, const char* end)
     return text;
 }
 
-std::string Quote(std::string_view token)
-{
-    return std::string(token.substr(0, kLongestQuote));
-}
-
 void AppendKey(TKBVHJoint& joint, const float* values)
 {
     Mat3 rotation = kMat3Identity;
@@ -57,7 +50,7 @@ void AppendKey(TKBVHJoint& joint, const float* values)
         if (channel < kFirstRotation)
             *components[channel] += value;
         else if (channel < kFirstScale)
-            RotateRows(rotation, channel - kFirstRotation, value * kDegreesToRadians);
+            RotateRows(rotation, static_cast<size_t>(channel - kFirstRotation), value * kDegreesToRadians);
     }
     joint.rotationKeys.push_back(QuatFromMat3(rotation));
     joint.positionKeys.push_back(position);
@@ -119,7 +112,6 @@ void CBVHRowReader::ReserveKeys(size_t frameCount, size_t byteCount)
 
 bool CBVHRowReader::ReadRows(CTextLines& lines, size_t frameCount)
 {
-    size_t forgetAt = lines.BytesLeft();
     ReserveKeys(frameCount, lines.BytesLeft());
     std::string_view row;
     for (size_t frame = 0; frame < frameCount; ++frame)
@@ -129,9 +121,6 @@ bool CBVHRowReader::ReadRows(CTextLines& lines, size_t frameCount)
         m_uiLine = lines.LineNumber();
         if (!ReadRow(row))
             return false;
-        if (forgetAt - lines.BytesLeft() < kForgetInterval)
-            continue;
-        forgetAt = lines.BytesLeft();
         lines.ForgetRead();
     }
     FillLastKeys();
@@ -248,11 +237,11 @@ void CBVHRowReader::LookForDoubledOffsets()
     --m_iProbes;
     size_t candidates = 0;
     std::vector<const TKBVHJoint*> repeating;
-    for (size_t i = 1; i < m_kColumns.size(); ++i)
+    for (const auto& [joint, first, pending] : m_kColumns)
     {
-        const auto& [joint, first, pending] = m_kColumns[i];
-        if (!HasPositions(*joint) || joint->offset == kVec3Zero ||
-            first + joint->channels.size() > m_uiValues)
+        if (joint->kind == EJointKind::Root || first + joint->channels.size() > m_uiValues)
+            continue;
+        if (!HasPositions(*joint) || joint->offset == kVec3Zero)
             continue;
         ++candidates;
         if (RepeatsOffset(*joint, &m_kRow[first]))

@@ -16,31 +16,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kNameLimit = 255;
-constexpr size_t kLongestQuote = 80;                    // of a word in the failure record
-constexpr size_t kBytesPerRow = 4;                      // a frame number, a value, a blank and a line feed
 constexpr std::string_view kEndSection = "[EndOfFile]"; // closes files of other programs
-
-bool IsSeparator(char c)
-{
-    return c == ' ' || c == ',' || (c >= '\t' && c <= '\r');
-}
-
-std::string_view SkipSeparators(std::string_view text)
-{
-    return {std::ranges::find_if_not(text, IsSeparator), text.end()};
-}
-
-// Passes over a number as "%d" does. False where there are no digits.
-bool SkipInteger(std::string_view& text)
-{
-    text = SkipSeparators(text);
-    if (text.starts_with('-') || text.starts_with('+'))
-        text.remove_prefix(1);
-    const size_t digits = std::min(text.find_first_not_of("0123456789"), text.size());
-    text.remove_prefix(digits);
-    return digits > 0;
-}
 
 bool TakeValue(std::string_view token, std::string& field)
 {
@@ -74,12 +50,12 @@ const CHTRReader::HandlerRow CHTRReader::kHandlers[] = {
 
 bool CHTRReader::Fail(EFailure reason, std::string_view name)
 {
-    return m_kRecord.Fail(reason, m_kLines.LineNumber(), std::string(name.substr(0, kLongestQuote)));
+    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
 }
 
 void CHTRReader::Warn(EFailure reason, std::string_view name)
 {
-    m_kRecord.Warn(reason, m_kLines.LineNumber(), std::string(name.substr(0, kLongestQuote)));
+    m_kRecord.Warn(reason, m_kLines.LineNumber(), Quote(name));
 }
 
 bool CHTRReader::Read()
@@ -226,101 +202,6 @@ bool CHTRReader::IndexSegments()
             m_kFile.segmentOfName.emplace(segment->name, segment);
         for (auto child = segment->children.rbegin(); child != segment->children.rend(); ++child)
             waiting.emplace_back(*child, depth + 1);
-    }
-    return true;
-}
-
-bool CHTRReader::ReadBasePosition(std::string_view)
-{
-    for (std::string_view line; NextSectionLine(line);)
-    {
-        if (!ReadBaseLine(line))
-            return false;
-    }
-    return true;
-}
-
-bool CHTRReader::ReadBaseLine(std::string_view line)
-{
-    const std::string_view name = NextWord(line);
-    const auto found = m_kFile.segmentOfName.find(name);
-    if (found == m_kFile.segmentOfName.end())
-    {
-        Warn(EFailure::UnknownSegment, name);
-        return true;
-    }
-    float numbers[7] = {};
-    size_t count = 0;
-    if (!ReadNumbers(line, numbers, count))
-        return false;
-    if (count < std::size(numbers))
-        Warn(EFailure::ShortRow, name);
-    TKHTRSegment& segment = *found->second;
-    segment.baseTranslation = {numbers[0], numbers[1], numbers[2]};
-    segment.baseRotation = {numbers[3], numbers[4], numbers[5]};
-    segment.boneLength = numbers[6];
-    return true;
-}
-
-bool CHTRReader::ReadSegment(std::string_view section)
-{
-    const std::string_view name = NextToken(section, "[]");
-    const auto found = m_kFile.segmentOfName.find(name);
-    if (found == m_kFile.segmentOfName.end())
-        return Fail(EFailure::UnknownSegment, name);
-    TKHTRSegment& segment = *found->second;
-    const auto frames = static_cast<size_t>(std::max(m_kFile.numFrames, 0));
-    const size_t rows = segment.scales.size() + std::min(frames, m_kLines.BytesLeft() / kBytesPerRow);
-    segment.translations.reserve(rows);
-    segment.rotations.reserve(rows);
-    segment.scales.reserve(rows);
-
-    float row[7] = {0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 1.0f};
-    for (std::string_view line; NextSectionLine(line);)
-    {
-        if (!ReadRow(segment, line, row))
-            return false;
-    }
-    return true;
-}
-
-// The frame number is passed over: rows count in the order of the file. A short row leaves the others as they
-// were in the row before.
-bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row)
-{
-    size_t count = 0;
-    if (!SkipInteger(line))
-        return Fail(EFailure::BadNumber, NextWord(line));
-    if (!ReadNumbers(line, row, count))
-        return false;
-    if (count == 0)
-        return Fail(EFailure::MissingTokens, segment.name);
-    if (count < row.size())
-        Warn(EFailure::ShortRow, segment.name);
-    segment.translations.push_back({row[0], row[1], row[2]});
-    segment.rotations.push_back({row[3], row[4], row[5]});
-    segment.scales.push_back(row[6]);
-    return true;
-}
-
-// As sscanf takes numbers: what is stuck to one begins the next. Commas separate like blanks.
-bool CHTRReader::ReadNumbers(std::string_view text, std::span<float, 7> numbers, size_t& count)
-{
-    for (count = 0; count < numbers.size(); ++count)
-    {
-        text = SkipSeparators(text);
-        if (text.empty())
-            return true;
-        ENumber kind;
-        const char* next;
-        const float value = ReadFloat(text.data(), text.data() + text.size(), next, kind);
-        std::string_view copy = text;
-        if (kind == ENumber::None || kind == ENumber::Unusual)
-            return Fail(EFailure::BadNumber, NextToken(copy));
-        if (kind == ENumber::Stuck)
-            Warn(EFailure::StuckNumber, NextToken(copy));
-        numbers[count] = value;
-        text.remove_prefix(static_cast<size_t>(next - text.data()));
     }
     return true;
 }

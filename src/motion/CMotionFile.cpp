@@ -3,6 +3,7 @@
 #include "CKeyframeControl.h"
 #include "CLineWriter.h"
 #include "Paths.h"
+#include "RestPose.h"
 #include "TKBVHStream.h"
 #include "TKHTRStream.h"
 
@@ -84,6 +85,7 @@ bool CMotionFile::Load(const std::string& path)
         m_kRecord = stream->m_kRecord;
         if (!loaded)
             return false;
+        JudgeRestPose(*stream->motionRoot, m_kRecord);
         motionRoot = stream->motionRoot;
         fileVersion = stream->fileVersion;
         if (row->hasRestTree)

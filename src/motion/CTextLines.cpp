@@ -6,6 +6,8 @@ namespace gw {
 
 namespace {
 
+constexpr size_t kForgetInterval = size_t{8} << 20;
+
 // The characters before a line feed, without the carriage return that belongs to it.
 std::string_view CutLineEnd(std::string_view text, size_t feed)
 {
@@ -17,7 +19,7 @@ std::string_view CutLineEnd(std::string_view text, size_t feed)
 
 EFailure CTextLines::Open(const std::string& path)
 {
-    m_kNow = m_kBefore = {};
+    Close();
     const EFailure failure = m_kFile.Open(path);
     m_kNow.m_uiOffset = m_kFile.Text().size() - SkipByteOrderMark(m_kFile.Text()).size();
     return failure;
@@ -27,11 +29,20 @@ void CTextLines::Close()
 {
     m_kFile.Close();
     m_kNow = m_kBefore = {};
+    m_uiForgotten = 0;
 }
 
 void CTextLines::StepBack()
 {
     m_kNow = m_kBefore;
+}
+
+void CTextLines::ForgetRead()
+{
+    if (m_kNow.m_uiOffset - m_uiForgotten < kForgetInterval)
+        return;
+    m_uiForgotten = m_kNow.m_uiOffset;
+    m_kFile.Forget(m_uiForgotten);
 }
 
 // What is left of the text. A line number begins with the first piece of a line.
@@ -71,6 +82,12 @@ bool CTextLines::NextRow(std::string_view& row)
     m_kNow.m_bInsideLine = false;
     m_kNow.m_uiOffset += feed == rest.npos ? rest.size() : feed + 1;
     return true;
+}
+
+std::string Quote(std::string_view text)
+{
+    constexpr size_t kLongestQuote = 80;
+    return std::string(text.substr(0, kLongestQuote));
 }
 
 } // namespace gw

@@ -34,8 +34,8 @@ public:
     size_t LineNumber() const { return m_kNow.m_uiLine; }
     size_t BytesLeft() const { return m_kFile.Text().size() - m_kNow.m_uiOffset; }
     size_t ByteCount() const { return m_kFile.Text().size(); }
-    /// Gives back the memory of what was read so far.
-    void ForgetRead() { m_kFile.Forget(m_kNow.m_uiOffset); }
+    /// Gives back the memory of what was read so far, when that is worth a call of the system.
+    void ForgetRead();
 
 private:
     struct Cursor
@@ -50,6 +50,10 @@ private:
     CMappedFile m_kFile;
     Cursor m_kNow;
     Cursor m_kBefore;
+    size_t m_uiForgotten = 0;
 };
+
+/// A word or line of a file for a failure record: its beginning, however long it is.
+std::string Quote(std::string_view text);
 
 } // namespace gw

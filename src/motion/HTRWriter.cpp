@@ -74,6 +74,14 @@ std::vector<size_t> NodesOfSegments(const TKHTRFile& file, const std::vector<CNo
     return found;
 }
 
+std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
+{
+    std::vector<float> times(static_cast<size_t>(std::max(frameCount, 0)));
+    for (size_t frame = 0; frame < times.size(); ++frame)
+        times[frame] = TimeOfFrame(static_cast<int>(frame), frequency, frameScale);
+    return times;
+}
+
 /// The rows of all segments, made when they are asked for or, where they depend on each other, beforehand.
 class CRows
 {
@@ -231,11 +239,7 @@ bool TKHTRStream::Save(const std::string& path, float frameScale)
     AddSegments(*restRoot, "GLOBAL", file);
     SwitchControls(*motionRoot, true);
 
-    const float frequency = GetFrequency();
-    std::vector<float> times;
-    for (int frame = 0; frame < file.numFrames; ++frame)
-        times.push_back(TimeOfFrame(frame, frequency, frameScale));
-    CRows rows(file, *motionRoot, std::move(times));
+    CRows rows(file, *motionRoot, FrameTimes(file.numFrames, GetFrequency(), frameScale));
     const bool written = WriteLines(path, [&](CLineWriter& out) {
         if (!rows.Prepare())
             return m_kRecord.Fail(EFailure::TooLarge);

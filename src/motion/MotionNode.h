@@ -14,6 +14,9 @@ class CKeyframeControl;
 /// attaching a child takes time by the number of its brothers.
 inline constexpr size_t kBoneLimit = 32768;
 
+/// Longer names of bones are refused.
+inline constexpr size_t kNameLimit = 255;
+
 /// Whether that many key times on that many nodes are in proportion to the file that asks for them: a count
 /// of frames is taken at its word, whatever rows follow.
 bool KeyTimesFit(int frameCount, size_t nodeCount, size_t fileBytes);

@@ -18,7 +18,6 @@ namespace gw {
 namespace {
 
 constexpr float kNoLength = 9.9999997e-07f; // the float of 1e-06, below which an offset has no direction
-constexpr size_t kLongestQuote = 80;        // of a word in the failure record
 
 float SignedBy(float sign, double angle)
 {
@@ -120,7 +119,7 @@ bool TKBVHStream::ReadNumber(std::string_view words, std::string_view& number)
     number = NextToken(rest);
     if (number.empty())
         return m_kRecord.Fail(EFailure::MissingTokens, lines.LineNumber(), std::string(words));
-    const std::string quote(number.substr(0, kLongestQuote));
+    const std::string quote = Quote(number);
     ENumber kind;
     ParseDouble(number, kind);
     if (kind == ENumber::None || kind == ENumber::Unusual)
@@ -138,8 +137,7 @@ bool TKBVHStream::ReadFrameTime(TKBVHFile& file)
     file.frameTime = static_cast<float>(ParseDouble(number));
     if (file.frameTime > 0.0f && std::isfinite(file.frameTime))
         return true;
-    return m_kRecord.Fail(EFailure::BadNumber, lines.LineNumber(),
-                          std::string(number.substr(0, kLongestQuote)));
+    return m_kRecord.Fail(EFailure::BadNumber, lines.LineNumber(), Quote(number));
 }
 
 bool TKBVHStream::BuildAnimatedTree(TKBVHFile& file)

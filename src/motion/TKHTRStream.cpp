@@ -18,22 +18,22 @@ namespace {
 
 // The axes of a rotation order (0 X, 1 Y, 2 Z) in the order of its letters, which is the order in which their
 // rotations are multiplied in from the left. None for an unknown order: it drops the rotation.
-std::vector<int> AxesOf(std::string_view order)
+std::vector<size_t> AxesOf(std::string_view order)
 {
     if (!std::ranges::is_permutation(order, std::string_view("XYZ")))
         return {};
-    std::vector<int> axes;
+    std::vector<size_t> axes;
     for (const char letter : order)
-        axes.push_back(letter - 'X');
+        axes.push_back(static_cast<size_t>(letter - 'X'));
     return axes;
 }
 
 // EulerToMat3(order, degrees) · base, for the inner loop.
-Mat3 RotatedBase(const std::vector<int>& axes, const Vec3& degrees, const Mat3& base)
+Mat3 RotatedBase(const std::vector<size_t>& axes, const Vec3& degrees, const Mat3& base)
 {
     const float angles[] = {degrees.x, degrees.y, degrees.z};
     Mat3 m = base;
-    for (const int axis : axes)
+    for (const size_t axis : axes)
         RotateRows(m, axis, angles[axis] * kDegreesToRadians);
     return m;
 }
@@ -43,7 +43,7 @@ Mat4 BaseMatrix(const TKHTRFile& file, const TKHTRSegment& segment)
     return Mat4Compose(EulerToMat3(file.eulerOrder, segment.baseRotation), segment.baseTranslation);
 }
 
-void AppendKeys(CKeyframeControl& track, const TKHTRSegment& segment, const std::vector<int>& axes,
+void AppendKeys(CKeyframeControl& track, const TKHTRSegment& segment, const std::vector<size_t>& axes,
                 const Mat3& base)
 {
     const size_t count = segment.translations.size();

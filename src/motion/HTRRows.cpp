@@ -1,0 +1,137 @@
+// The half of CHTRReader that reads numbers: base positions and rows.
+
+#include "CHTRReader.h"
+#include "CTextLines.h"
+#include "Numbers.h"
+#include "TKHTRFile.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kBytesPerRow = 4; // a frame number, a value, a blank and a line feed
+
+bool IsSeparator(char c)
+{
+    return c == ' ' || c == ',' || (c >= '\t' && c <= '\r');
+}
+
+std::string_view SkipSeparators(std::string_view text)
+{
+    return {std::ranges::find_if_not(text, IsSeparator), text.end()};
+}
+
+// Passes over a number as "%d" does. False where there are no digits.
+bool SkipInteger(std::string_view& text)
+{
+    text = SkipSeparators(text);
+    if (text.starts_with('-') || text.starts_with('+'))
+        text.remove_prefix(1);
+    const size_t digits = std::min(text.find_first_not_of("0123456789"), text.size());
+    text.remove_prefix(digits);
+    return digits > 0;
+}
+
+} // namespace
+
+bool CHTRReader::ReadBasePosition(std::string_view)
+{
+    for (std::string_view line; NextSectionLine(line);)
+    {
+        if (!ReadBaseLine(line))
+            return false;
+    }
+    return true;
+}
+
+bool CHTRReader::ReadBaseLine(std::string_view line)
+{
+    const std::string_view name = NextWord(line);
+    const auto found = m_kFile.segmentOfName.find(name);
+    if (found == m_kFile.segmentOfName.end())
+    {
+        Warn(EFailure::UnknownSegment, name);
+        return true;
+    }
+    float numbers[7] = {};
+    size_t count = 0;
+    if (!ReadNumbers(line, numbers, count))
+        return false;
+    if (count < std::size(numbers))
+        Warn(EFailure::ShortRow, name);
+    TKHTRSegment& segment = *found->second;
+    segment.baseTranslation = {numbers[0], numbers[1], numbers[2]};
+    segment.baseRotation = {numbers[3], numbers[4], numbers[5]};
+    segment.boneLength = numbers[6];
+    return true;
+}
+
+bool CHTRReader::ReadSegment(std::string_view section)
+{
+    const std::string_view name = NextToken(section, "[]");
+    const auto found = m_kFile.segmentOfName.find(name);
+    if (found == m_kFile.segmentOfName.end())
+        return Fail(EFailure::UnknownSegment, name);
+    TKHTRSegment& segment = *found->second;
+    const auto frames = static_cast<size_t>(std::max(m_kFile.numFrames, 0));
+    const size_t rows = segment.scales.size() + std::min(frames, m_kLines.BytesLeft() / kBytesPerRow);
+    segment.translations.reserve(rows);
+    segment.rotations.reserve(rows);
+    segment.scales.reserve(rows);
+
+    float row[7] = {0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 1.0f};
+    for (std::string_view line; NextSectionLine(line);)
+    {
+        if (!ReadRow(segment, line, row))
+            return false;
+        m_kLines.ForgetRead();
+    }
+    return true;
+}
+
+// The frame number is passed over: rows count in the order of the file. A short row leaves the others as they
+// were in the row before.
+bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row)
+{
+    size_t count = 0;
+    if (!SkipInteger(line))
+        return Fail(EFailure::BadNumber, NextWord(line));
+    if (!ReadNumbers(line, row, count))
+        return false;
+    if (count == 0)
+        return Fail(EFailure::MissingTokens, segment.name);
+    if (count < row.size())
+        Warn(EFailure::ShortRow, segment.name);
+    segment.translations.push_back({row[0], row[1], row[2]});
+    segment.rotations.push_back({row[3], row[4], row[5]});
+    segment.scales.push_back(row[6]);
+    return true;
+}
+
+// As sscanf takes numbers: what is stuck to one begins the next. Commas separate like blanks.
+bool CHTRReader::ReadNumbers(std::string_view text, std::span<float, 7> numbers, size_t& count)
+{
+    for (count = 0; count < numbers.size(); ++count)
+    {
+        text = SkipSeparators(text);
+        if (text.empty())
+            return true;
+        ENumber kind;
+        const char* next;
+        const float value = ReadFloat(text.data(), text.data() + text.size(), next, kind);
+        std::string_view copy = text;
+        if (kind == ENumber::None || kind == ENumber::Unusual)
+            return Fail(EFailure::BadNumber, NextToken(copy));
+        if (kind == ENumber::Stuck)
+            Warn(EFailure::StuckNumber, NextToken(copy));
+        numbers[count] = value;
+        text.remove_prefix(static_cast<size_t>(next - text.data()));
+    }
+    return true;
+}
+
+} // namespace gw
