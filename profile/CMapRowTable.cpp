@@ -1,5 +1,6 @@
 #include "CMapRowTable.h"
 
+#include "HostBones.h"
 #include "Numbers.h"
 #include "Text.h"
 
@@ -73,6 +74,12 @@ void CMapRowTable::AddRow(std::string_view source, std::string_view target, cons
         WriteRotation(row, numbers);
     if (columns == ERowColumns::All)
         WriteAxes(row, numbers.axes);
+}
+
+void CMapRowTable::AddPelvisRows()
+{
+    for (const std::string_view pelvis : kPelvisBones)
+        AddRow(kFixedSource, pelvis, {}, ERowColumns::NamesAndRotation);
 }
 
 void CMapRowTable::RemoveRow(int row)

@@ -69,6 +69,8 @@ public:
     /// index 0 keeps the rotation that it was added with.
     void AddRow(std::string_view source, std::string_view target, const CRowNumbers& numbers,
                 ERowColumns columns);
+    /// Sees to it that each of the bones that no source drives has a row. New rows are fixed ones.
+    void AddPelvisRows();
     /// Nothing for a row that is none.
     void RemoveRow(int row);
     void Clear();

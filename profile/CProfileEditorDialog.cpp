@@ -266,12 +266,6 @@ void CProfileEditorDialog::RemoveMapRow(int row)
     UpdateButtons();
 }
 
-void CProfileEditorDialog::ForcePelvisRows()
-{
-    for (const std::string_view pelvis : kPelvisBones)
-        AddMapRow(kFixedSource, pelvis, {}, ERowColumns::NamesAndRotation);
-}
-
 void CProfileEditorDialog::AddToMap()
 {
     if (m_kSourceTree.Selected() == CBoneTree::kNone || m_kTargetTree.Selected() == CBoneTree::kNone)

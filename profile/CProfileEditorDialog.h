@@ -122,7 +122,7 @@ public:
                    ERowColumns columns = ERowColumns::All);
     void RemoveMapRow(int row);
     /// Sees to it that the two pelvis bones, which no source drives, have a row.
-    void ForcePelvisRows();
+    void ForcePelvisRows() { m_kRows.AddPelvisRows(); }
     void RebuildSourceTree() { m_kSourceTree.Rebuild(m_pkSourceScene); }
     void RebuildTargetTree() { m_kTargetTree.Rebuild(m_pkTargetScene); }
     void MarkSourceBone(int item, bool mapped) { m_kSourceTree.Mark(item, mapped); }

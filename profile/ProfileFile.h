@@ -17,7 +17,7 @@ class CMapRowTable;
 inline constexpr std::string_view kFixedSource = "[FIXED]";
 
 /// The most bytes that a profile may have; a full skeleton takes a fiftieth of this.
-inline constexpr size_t kProfileByteLimit = 256 * 1024;
+inline constexpr size_t kProfileByteLimit = 262'144;
 
 /// The platform's line end, which ends every line that is written.
 inline constexpr std::string_view kLineEnd =

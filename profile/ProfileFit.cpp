@@ -1,78 +1,75 @@
 #include "ProfileFit.h"
 
+#include "CMapRowTable.h"
 #include "FindBone.h"
 #include "HostBones.h"
-#include "ProfileFile.h"
 #include "Text.h"
-
-#include <unordered_set>
 
 namespace gw {
 
 namespace {
 
-// Looks up rows and keeps what is missing.
-class CFitMeter
+// A profile with more bones that are missing belongs to another skeleton, and comparing names takes time.
+constexpr size_t kNearestLimit = 100;
+
+bool Has(const CBoneNames& bones, const std::string& name, ESkeletonSide side, int row, CProfileFit& fit)
 {
-public:
-    CFitMeter(CNode* sourceRoot, CNode* targetRoot, CProfileFit& fit)
-        : m_kSources(sourceRoot), m_kTargets(targetRoot), m_kFit(fit)
-    {
-    }
+    if (bones.Find(name))
+        return true;
+    const bool compare = fit.missing.size() < kNearestLimit;
+    fit.missing.push_back({side, name, compare ? NearestName(name, bones.Names()) : std::string(), row, 0});
+    return false;
+}
 
-    // A later row of the same target changes numbers, and never the bones.
-    void AddRow(const CProfileLine& row)
+// The rows as loading the file would leave them, and the line that each came from.
+CMapRowTable ReadRows(CProfileReader& reader, std::vector<size_t>& lines)
+{
+    CMapRowTable rows;
+    CProfileLine line;
+    while (reader.Next(line))
     {
-        if (!m_kSeen.insert(LowerCase(row.target)).second)
-            return;
-        const bool hasSource =
-            row.kind == EProfileLine::Fixed || Has(m_kSources, ESkeletonSide::Source, row.source, row.line);
-        const bool hasTarget = Has(m_kTargets, ESkeletonSide::Target, row.target, row.line);
-        ++m_kFit.rowCount;
-        m_kFit.foundCount += hasSource && hasTarget ? 1 : 0;
-        if (row.kind == EProfileLine::Mapping && EqualNoCase(row.target, kRootBone))
-            m_kFit.drivesRoot = hasSource && hasTarget;
+        if (line.kind == EProfileLine::Fixed || line.kind == EProfileLine::Mapping)
+            rows.AddRow(line.source, line.target, line.numbers, ERowColumns::All);
+        lines.resize(static_cast<size_t>(rows.RowCount()), line.line);
     }
-
-private:
-    bool Has(const CBoneNames& bones, ESkeletonSide side, const std::string& name, size_t line)
-    {
-        if (bones.Find(name))
-            return true;
-        m_kFit.missing.push_back({side, name, NearestName(name, bones.Names()), line});
-        return false;
-    }
-
-    CBoneNames m_kSources;
-    CBoneNames m_kTargets;
-    CProfileFit& m_kFit;
-    std::unordered_set<std::string> m_kSeen; // targets in lower case
-};
+    rows.AddPelvisRows();
+    lines.resize(static_cast<size_t>(rows.RowCount()));
+    return rows;
+}
 
 } // namespace
+
+CProfileFit MeasureFit(const CMapRowTable& rows, CNode* sourceRoot, CNode* targetRoot)
+{
+    const CBoneNames sources(sourceRoot);
+    const CBoneNames targets(targetRoot);
+    CProfileFit fit;
+    fit.rowCount = rows.RowCount();
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        const std::string& target = rows.Text(row, kTargetColumn);
+        const bool fixed = rows.IsFixed(row);
+        const bool hasSource =
+            fixed || Has(sources, rows.Text(row, kSourceColumn), ESkeletonSide::Source, row, fit);
+        const bool hasTarget = Has(targets, target, ESkeletonSide::Target, row, fit);
+        fit.foundCount += hasSource && hasTarget ? 1 : 0;
+        if (EqualNoCase(target, kRootBone))
+            fit.drivesRoot = !fixed && hasSource && hasTarget;
+    }
+    return fit;
+}
 
 bool MeasureFit(const std::string& path, CNode* sourceRoot, CNode* targetRoot, CProfileFit& fit)
 {
     std::string text;
     if (!ReadProfileText(path, text))
         return false;
-    fit = {};
     CProfileReader reader(text);
+    std::vector<size_t> lines;
+    fit = MeasureFit(ReadRows(reader, lines), sourceRoot, targetRoot);
     fit.name = reader.Name();
-    CFitMeter meter(sourceRoot, targetRoot, fit);
-    CProfileLine line;
-    while (reader.Next(line))
-    {
-        if (line.kind == EProfileLine::Fixed || line.kind == EProfileLine::Mapping)
-            meter.AddRow(line);
-    }
-    for (const std::string_view pelvis : kPelvisBones)
-    {
-        CProfileLine row;
-        row.kind = EProfileLine::Fixed;
-        row.target = pelvis;
-        meter.AddRow(row);
-    }
+    for (CMissingBone& bone : fit.missing)
+        bone.line = lines[static_cast<size_t>(bone.row)];
     return true;
 }
 

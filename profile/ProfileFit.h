@@ -7,6 +7,7 @@
 
 namespace gw {
 
+class CMapRowTable;
 class CNode;
 
 enum class ESkeletonSide : uint8_t
@@ -20,8 +21,10 @@ struct CMissingBone
 {
     ESkeletonSide side = ESkeletonSide::Source;
     std::string name;
-    std::string nearest; ///< the most similar name in that skeleton, or empty where none is similar
-    size_t line = 0;     ///< in the profile's file, from 1 on; 0 for a row that every profile gets
+    std::string nearest; ///< the most similar name in that skeleton, or empty where none is similar; for the
+                         ///< first 100
+    int row = 0;         ///< in the row table
+    size_t line = 0;     ///< in the file, from 1 on; 0 for rows of no file
 };
 
 /// How a profile fits two skeletons, as applying it would find.
@@ -37,7 +40,10 @@ struct CProfileFit
     bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
 };
 
-/// Measures how the profile in a file fits. False when the file cannot be read. Null roots have no bones.
+/// Measures how the rows of a table fit. Null roots have no bones.
+CProfileFit MeasureFit(const CMapRowTable& rows, CNode* sourceRoot, CNode* targetRoot);
+/// The same for the rows that loading a file would give. False, and the fit left alone, when it cannot be
+/// read.
 bool MeasureFit(const std::string& path, CNode* sourceRoot, CNode* targetRoot, CProfileFit& fit);
 
 } // namespace gw

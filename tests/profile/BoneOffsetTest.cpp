@@ -1,0 +1,82 @@
+// The rules of the dialog that edits one row.
+#include "ProfileFixture.h"
+
+#include <gmock/gmock.h>
+
+namespace gw {
+
+TEST(BoneOffsetDialog, RotationLimitsAreUneven)
+{
+    const struct
+    {
+        const char* what;
+        int axis;
+        const char* text;
+        const char* shown;
+    } rows[] = {
+        {"X at half a circle",  0, "-180",        "-180"},
+        {"X beyond",            0, "181",         "7"   },
+        {"Y at its limit",      1, "179",         "179" },
+        {"Y at half a circle",  1, "-180",        "7"   },
+        {"Z at half a circle",  2, "180",         "7"   },
+        {"Z with words behind", 2, " -90 deg",    "-90" },
+        {"no number is 0",      0, "",            "0"   },
+        {"beyond 32 bits",      0, "99999999999", "7"   },
+    };
+    for (const auto& row : rows)
+    {
+        CRowNumbers numbers;
+        numbers.rotation = {7, 7, 7};
+        CBoneOffsetDialog dialog(numbers);
+        dialog.LeaveRotation(row.axis, row.text);
+        EXPECT_EQ(dialog.RotationText(row.axis), row.shown) << row.what;
+        EXPECT_EQ(std::to_string(dialog.Numbers().rotation[size_t(row.axis)]), row.shown) << row.what;
+    }
+}
+
+TEST(BoneOffsetDialog, ChosenAxisIsSwappedOutOfTheOtherBoxes)
+{
+    const struct
+    {
+        const char* what;
+        int axis;
+        const char* entry;
+        AxisCodes before;
+        AxisCodes after;
+    } rows[] = {
+        {"Y box holds it",          0, "Y",  {1, 2, 3},  {2, 1, 3} },
+        {"reversed counts as held", 0, "-Z", {1, 2, 3},  {-3, 2, 1}},
+        {"old sign goes along",     2, "X",  {1, 2, -3}, {-3, 2, 1}},
+        {"own axis reversed",       1, "-Y", {1, 2, 3},  {1, -2, 3}},
+        {"both boxes hold it",      0, "Y",  {1, 2, -2}, {2, 1, 1} },
+    };
+    for (const auto& row : rows)
+    {
+        CRowNumbers numbers;
+        numbers.axes = row.before;
+        CBoneOffsetDialog dialog(numbers);
+        const auto& entries = CBoneOffsetDialog::kAxisEntries;
+        const auto entry = std::find(entries.begin(), entries.end(), row.entry) - entries.begin();
+        dialog.ChooseAxis(row.axis, int(entry));
+        EXPECT_EQ(dialog.Numbers().axes, row.after) << row.what;
+        EXPECT_EQ(entries[size_t(dialog.AxisEntry(row.axis))], row.entry) << row.what;
+        dialog.ChooseAxis(row.axis, 6);
+        dialog.ChooseAxis(row.axis, -1);
+        EXPECT_EQ(dialog.Numbers().axes, row.after) << "no such entries";
+    }
+}
+
+TEST(BoneOffsetDialog, AxesStayASignedPermutation)
+{
+    CBoneOffsetDialog dialog;
+    for (int step = 0; step < 1000; ++step)
+    {
+        dialog.ChooseAxis(step % 3, (step * 7 + step / 5) % 6);
+        AxisCodes letters = dialog.Numbers().axes;
+        for (int& code : letters)
+            code = std::abs(code);
+        ASSERT_THAT(letters, testing::UnorderedElementsAre(1, 2, 3)) << step;
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,84 @@
+// The older map lines.
+#include "MapLines.h"
+
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+std::string Describe(const CMapLine& line)
+{
+    const std::string three = PositionLine(line.numbers).substr(9);
+    switch (line.kind)
+    {
+    case EMapLine::Text:
+        return "text";
+    case EMapLine::Position:
+        return "at " + three;
+    case EMapLine::FrameRate:
+        return "rate " + std::to_string(line.frameRate);
+    case EMapLine::Fixed:
+        return "fixed " + line.target;
+    case EMapLine::Mapping:
+        break;
+    }
+    return line.source + '>' + line.target + (line.hasRotation ? ' ' + three : "");
+}
+
+} // namespace
+
+TEST(MapLines, LinesSayWhatTheirKeySays)
+{
+    const struct
+    {
+        const char* what;
+        const char* text;
+        const char* says;
+    } rows[] = {
+        {"free text",        "Unknown Source",           "text"         },
+        {"empty",            "",                         "text"         },
+        {"position, commas", "Position 1,-2,3",          "at 1,-2,3"    },
+        {"position, blanks", "POSITION 1 -2 3.5",        "at 1,-2,3"    },
+        {"position, cut",    "Position 5",               "at 5,0,0"     },
+        {"frame rate",       "FrameRate 60",             "rate 60"      },
+        {"as first added",   "A <---> Head .",           "A>Head"       },
+        {"with rotation",    "A <---> Head 1,-2,3",      "A>Head 1,-2,3"},
+        {"rotation, blanks", "A <---> Head 1 -2 3",      "A>Head 1,-2,3"},
+        {"a profile's row",  "A <---> Head 1,2,3,3,2,1", "A>Head 1,2,3" },
+        {"the arrow wins",   "Position <---> Head .",    "Position>Head"},
+        {"cut mapping",      "A <--->",                  "A>"           },
+        {"fixed row",        "* Head . .1,2,3",          "fixed Head"   },
+    };
+    for (const auto& row : rows)
+    {
+        const CMapLine line = ParseMapLine(row.text);
+        EXPECT_EQ(line.text, row.text);
+        EXPECT_EQ(Describe(line), row.says) << row.what;
+    }
+}
+
+TEST(MapLines, FileHoldsTheLinesAsTheyStand)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("map.txt");
+    std::vector<CMapLine> lines;
+    EXPECT_FALSE(ReadMapLines(path, lines));
+    for (const std::string& text :
+         {std::string("Unknown Source"), PositionLine({1.9f, -2.9f, 0}), FrameRateLine(60),
+          MappingLine("A", "Head"), MappingLine("B", "Waist", {1, -2, 3})})
+        lines.push_back(ParseMapLine(text));
+    ASSERT_TRUE(WriteMapLines(path, lines));
+    const std::string text = ReadBytes(path);
+    EXPECT_EQ(text, "Unknown Source\nPosition 1,-2,0\nFrameRate 60\nA <---> Head .\nB <---> Waist 1,-2,3\n");
+    std::vector<CMapLine> again;
+    ASSERT_TRUE(ReadMapLines(path, again));
+    ASSERT_EQ(again.size(), lines.size());
+    EXPECT_EQ(again.back().numbers, (Vec3{1, -2, 3}));
+    ASSERT_TRUE(WriteMapLines(path, again));
+    EXPECT_EQ(ReadBytes(path), text);
+}
+
+} // namespace gw

@@ -1,0 +1,182 @@
+// Where a profile meets two skeletons: look-ups by name, the retargeter's tables, and how well a file fits.
+#include "ProfileFixture.h"
+
+#include "CRetargeter.h"
+#include "FindBone.h"
+#include "ProfileFit.h"
+
+#include <gmock/gmock.h>
+
+namespace gw {
+
+using testing::ElementsAre;
+
+TEST_F(ProfileEditor, ApplyingFillsTheTablesWithWhatDiffers)
+{
+    Load("N\nA x LowerTorso 0,0,0,1,2,3\nB x Waist 10,-20,30,1,2,3\nc x HEAD 0,0,0,-1,3,2\n");
+    CRetargeter retargeter;
+    int matched = -1;
+    int total = -1;
+    EXPECT_TRUE(m_kEditor.ApplyProfile(&retargeter, &matched, &total));
+    EXPECT_EQ(matched, 5);
+    EXPECT_EQ(total, 5) << "fixed rows count here";
+    CNode* hip = FindBone(m_spkTarget.Get(), "LowerTorso");
+    CNode* waist = FindBone(m_spkTarget.Get(), "Waist");
+    CNode* head = FindBone(m_spkTarget.Get(), "Head");
+    EXPECT_EQ(retargeter.SourceOf(hip), FindBone(m_spkSource.Get(), "A"));
+    EXPECT_EQ(retargeter.SourceOf(head), FindBone(m_spkSource.Get(), "C"));
+    EXPECT_EQ(retargeter.OffsetAngles(hip), kVec3Zero);
+    EXPECT_EQ(retargeter.OffsetAngles(waist), (Vec3{10, -20, 30}));
+    EXPECT_EQ(retargeter.OffsetMatrix(waist), kMat3Identity);
+    EXPECT_EQ(retargeter.OffsetMatrix(head), AxisMatrix({-1, 3, 2}));
+    bool fixed = false;
+    EXPECT_TRUE(retargeter.IsFixed(FindBone(m_spkTarget.Get(), "LPelvis"), fixed) && fixed);
+    EXPECT_FALSE(retargeter.IsFixed(head, fixed));
+
+    Load("N\nB x Head 0\n");
+    m_kEditor.ApplyProfile(&retargeter, nullptr, nullptr);
+    EXPECT_EQ(retargeter.SourceOf(hip), nullptr) << "nothing of the profile before is left";
+}
+
+TEST_F(ProfileEditor, OneMissingBoneFailsTheProfileAndSparesTheOtherRows)
+{
+    const struct
+    {
+        const char* what;
+        const char* lines;
+        int matched;
+        int total;
+        bool rootMapping;
+    } rows[] = {
+        {"source missing",       "None x LowerTorso 0\nA x Head 0\n",   3, 4, true },
+        {"target missing",       "B x None 0\nA x Head 0\n",            3, 4, false},
+        {"fixed target missing", "* None . .1,2,3\nA x Head 0\n",       3, 4, false},
+        {"all there, no root",   "A x Head 0\n",                        3, 3, false},
+        {"fixed root counts",    "* lowertorso . .1,2,3\nA x Head 0\n", 4, 4, true },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        m_kEditor.LoadProfile(MakeProfile(std::string("N\n") + row.lines));
+        m_kEditor.RebuildSourceTree();
+        int matched = -1;
+        int total = -1;
+        EXPECT_EQ(m_kEditor.ApplyProfile(nullptr, &matched, &total), row.matched == row.total);
+        EXPECT_EQ(matched, row.matched);
+        EXPECT_EQ(total, row.total);
+        EXPECT_EQ(m_kEditor.HasRootMapping(), row.rootMapping);
+        EXPECT_TRUE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("A")));
+    }
+}
+
+TEST_F(ProfileEditor, ApplyingClampsTheFieldsAndStoresNothing)
+{
+    Load("N\nFrameRate 10\n");
+    EXPECT_TRUE(m_kEditor.ApplyProfile(nullptr, nullptr, nullptr)) << "a table without misfits";
+    EXPECT_THAT(m_kOwner.TakeMessages(), ElementsAre("157 30 240"));
+    EXPECT_EQ(m_kEditor.FieldText(kFrameRateField), "30");
+    EXPECT_EQ(m_kEditor.GetFrameRate(), 10);
+
+    CProfileEditorDialog noScenes(m_kOwner);
+    int total = -1;
+    EXPECT_FALSE(noScenes.ApplyProfile(nullptr, nullptr, &total));
+    EXPECT_EQ(total, -1);
+}
+
+TEST(FindBone, ExactNameFirstThenAnyCase)
+{
+    const Ref<CNode> root = MakeChain({"hips", "Hips", "Spine", "SPINE"});
+    CNode* second = static_cast<CNode*>(root->ChildAt(0));
+    EXPECT_EQ(FindBone(root.Get(), "hips"), root.Get());
+    EXPECT_EQ(FindBone(root.Get(), "Hips"), second);
+    EXPECT_EQ(FindBone(root.Get(), "HIPS"), root.Get()) << "the first in search order";
+    EXPECT_EQ(FindBone(root.Get(), "spine")->NameView(), "Spine");
+    EXPECT_EQ(FindBone(root.Get(), "none"), nullptr);
+    EXPECT_EQ(FindBone(nullptr, "hips"), nullptr);
+    second->SetName(nullptr);
+    EXPECT_EQ(FindBone(root.Get(), ""), nullptr) << "no name is not an empty name";
+}
+
+TEST(BoneTree, ShowsEachNameOnceBelowItsParent)
+{
+    const Ref<CNode> root = MakeChain({"Hips", "Spine", "hips", "Head"});
+    auto* spine = static_cast<CNode*>(root->ChildAt(0));
+    spine->AttachChild(MakeChain({"Arm"}).Get());
+    CBoneTree tree(4);
+    tree.Rebuild(root.Get());
+    ASSERT_EQ(tree.Items().size(), 4u);
+    EXPECT_EQ(tree.RootItems(), std::vector<int>{0});
+    EXPECT_EQ(tree.Items()[1].m_kChildren, std::vector<int>{3}) << "Arm";
+    EXPECT_EQ(tree.Items()[0].m_kChildren, (std::vector<int>{1, 2}))
+        << "Head hangs on the item with its parent's name";
+    EXPECT_EQ(tree.Text(2), "Head");
+
+    tree.Select(tree.Find("HEAD"));
+    tree.Mark(2, true);
+    tree.Mark(-1, true);
+    tree.Mark(99, true);
+    EXPECT_EQ(tree.SelectedText(), "Head");
+    EXPECT_EQ(tree.Image(0) + 10 * tree.SelectedImage(0), 20);
+    EXPECT_EQ(tree.Image(2) + 10 * tree.SelectedImage(2), 34);
+
+    spine->SetName(nullptr);
+    tree.Rebuild(root.Get());
+    EXPECT_EQ(tree.Selected(), CBoneTree::kNone);
+    EXPECT_EQ(tree.RootItems().size(), 2u) << "Arm has no named parent, Head has the first hips";
+}
+
+TEST(ProfileFit, NamesTheSideTheLineAndTheNearestBone)
+{
+    const CTempFolder folder;
+    const Ref<CNode> source = MakeChain({"Hips", "LeftUpLeg"});
+    const Ref<CNode> target = MakeChain({"LowerTorso", "LThigh", "RThigh", "LPelvis"});
+    const std::string path = folder.Path("a.prf");
+    WriteBytes(path, "Fit\nFrameRate 60\nHip x LowerTorso 0\nLeftUpLeg x LThigh 0\nelse x LTHIGH 0\n"
+                     "* Rthig . .1,2,3\nqqqqqqqq x Unknown 0\n");
+    CProfileFit fit;
+    ASSERT_TRUE(MeasureFit(path, source.Get(), target.Get(), fit));
+    EXPECT_EQ(fit.name, "Fit");
+    EXPECT_EQ(fit.rowCount, 6) << "four targets of the file and the two pelvis bones";
+    EXPECT_EQ(fit.foundCount, 2);
+    EXPECT_FALSE(fit.drivesRoot);
+    EXPECT_FALSE(fit.IsWhole());
+    std::vector<std::string> missing;
+    for (const CMissingBone& bone : fit.missing)
+        missing.push_back(std::to_string(bone.line) +
+                          (bone.side == ESkeletonSide::Source ? " source " : " target ") + bone.name + " " +
+                          bone.nearest);
+    EXPECT_THAT(missing, ElementsAre("3 source Hip Hips", "6 target Rthig RThigh", "7 source qqqqqqqq ",
+                                     "7 target Unknown ", "0 target RPelvis LPelvis"));
+    EXPECT_FALSE(MeasureFit(folder.Path("none.prf"), source.Get(), target.Get(), fit));
+    EXPECT_EQ(fit.rowCount, 6) << "left alone";
+}
+
+TEST(ProfileFit, AgreesWithApplyingTheProfile)
+{
+    CScriptedOwner owner;
+    const Ref<CNode> source = MakeChain({"A", "B"});
+    const Ref<CNode> target = MakeChain({"LowerTorso", "Head", "LPelvis", "RPelvis"});
+    CProfileEditorDialog editor(owner);
+    editor.SetSourceScene(source.Get());
+    editor.SetResultScene(target.Get());
+    for (const char* lines : {"A x LowerTorso 0\n", "* LowerTorso . .1,2,3\n", "a x Head 0\nB x head 0\n\n",
+                              "C x LowerTorso 0\nA x LPelvis 0\n", "\n* RPelvis\n* None\n"})
+    {
+        SCOPED_TRACE(lines);
+        const std::string path = owner.ProfileFile("a.prf");
+        WriteBytes(path, std::string("N\nFrameRate 30\n") + lines);
+        editor.LoadProfile(path);
+        int matched = 0;
+        int total = 0;
+        const bool applied = editor.ApplyProfile(nullptr, &matched, &total);
+        CProfileFit fit;
+        ASSERT_TRUE(MeasureFit(path, source.Get(), target.Get(), fit));
+        EXPECT_EQ(fit.foundCount, matched);
+        EXPECT_EQ(fit.rowCount, total);
+        EXPECT_EQ(fit.missing.empty(), applied);
+        EXPECT_EQ(MeasureFit(editor.Rows(), source.Get(), target.Get()).foundCount, matched);
+        EXPECT_TRUE(editor.HasRootMapping() || !fit.drivesRoot);
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,216 @@
+// The editor's model: what the user's fields, clicks and selections do.
+#include "ProfileFixture.h"
+
+#include <gmock/gmock.h>
+
+namespace gw {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
+{
+    const struct
+    {
+        const char* what;
+        int field;
+        const char* text;
+        const char* shown;
+        const char* message;
+    } rows[] = {
+        {"rate too low",            kFrameRateField, "10",          "30",     "157 30 240"      },
+        {"rate too high",           kFrameRateField, "241",         "240",    "157 30 240"      },
+        {"no number",               kFrameRateField, "fast",        "30",     "157 30 240"      },
+        {"offset too low",          kOffsetXField,   "-10001",      "-10000", "157 -10000 10000"},
+        {"beyond 32 bits",          kOffsetZField,   "99999999999", "10000",  "157 -10000 10000"},
+        {"at the limit",            kOffsetYField,   "10000",       "10000",  nullptr           },
+        {"what follows counts not", kFrameRateField, "60 fps",      "60",     nullptr           },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CProfileEditorDialog editor(m_kOwner);
+        editor.EditField(row.field, row.text);
+        editor.CommitFields(EFieldCommit::Check);
+        EXPECT_EQ(editor.GetFrameRate(), 30) << "checking stores nothing";
+        EXPECT_FALSE(editor.IsDirty());
+        editor.LeaveField();
+        EXPECT_EQ(editor.FieldText(row.field), row.shown);
+        EXPECT_TRUE(editor.IsDirty() || std::string(row.shown) == "30");
+        const auto messages = m_kOwner.TakeMessages();
+        EXPECT_EQ(messages, row.message ? std::vector<std::string>{row.message} : std::vector<std::string>{});
+    }
+}
+
+TEST_F(ProfileEditor, RenameIsTakenOrRefusedWhole)
+{
+    m_kNamesInUse = {"Mine", "Stock"};
+    const std::string e64 = "\xc3\xa9" + std::string(63, 'e');
+    const std::string e65 = e64 + 'e';
+    const struct
+    {
+        const char* what;
+        std::string typed;
+        std::string name;
+        bool refused;
+        bool dirty;
+    } rows[] = {
+        {"free name",        "New one ", "New one", false, true },
+        {"taken name",       "stock",    "Mine",    true,  false},
+        {"empty name",       "  ",       "Mine",    true,  false},
+        {"case alone",       "MINE",     "Mine",    false, true },
+        {"cut at the limit", e65,        e64,       false, true },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CProfileEditorDialog editor(m_kOwner);
+        editor.SetNamesInUse(&m_kNamesInUse);
+        editor.LoadProfile(MakeProfile("Mine\n", "Mine.prf"));
+        editor.MarkChanged(); // pending before the rename
+        editor.EditField(kNameField, row.typed);
+        editor.LeaveField();
+        std::string name;
+        editor.GetProfileName(name);
+        EXPECT_EQ(name, row.name);
+        EXPECT_EQ(editor.IsDirty(), row.dirty);
+        if (row.refused)
+        {
+            EXPECT_THAT(m_kOwner.TakeMessages(), ElementsAre("158"));
+            EXPECT_EQ(editor.FieldText(kNameField), "Mine");
+        }
+        EXPECT_THAT(m_kOwner.TakeMessages(), IsEmpty());
+    }
+}
+
+TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
+{
+    Load("N\nA x Waist 0\n");
+    const struct
+    {
+        const char* what;
+        const char* source;
+        const char* target;
+        bool addToMap;
+    } rows[] = {
+        {"both free",                  "B",    "Head",    true },
+        {"nothing selected in source", "none", "Head",    false},
+        {"nothing selected in target", "B",    "none",    false},
+        {"source is mapped",           "A",    "Head",    false},
+        {"target is mapped",           "B",    "Waist",   false},
+        {"pelvis takes no source",     "B",    "LPelvis", false},
+        {"neither does the other",     "B",    "RPelvis", false},
+    };
+    for (const auto& row : rows)
+    {
+        SelectBones(row.source, row.target);
+        EXPECT_EQ(m_kEditor.Buttons().addToMap, row.addToMap) << row.what;
+    }
+    SelectBones("B", "Head");
+    m_kEditor.ClickButton(kAddToMapButton);
+    EXPECT_EQ(RowText(m_kEditor.Rows(), 3), "B|Head|0|0|0|||");
+    EXPECT_FALSE(m_kEditor.Buttons().addToMap) << "both are mapped now";
+    EXPECT_TRUE(m_kEditor.Buttons().saveProfile);
+    const CBoneTree& tree = m_kEditor.TargetTree();
+    EXPECT_EQ(tree.Image(tree.Selected()), 4);
+    EXPECT_EQ(m_kEditor.SourceTree().Image(m_kEditor.SourceTree().Selected()), 1);
+    EXPECT_EQ(tree.SelectedImage(tree.Selected()), 3);
+}
+
+TEST_F(ProfileEditor, RowButtonsFollowTheSelection)
+{
+    m_kEditor.UpdateButtons();
+    EXPECT_FALSE(m_kEditor.Buttons().removeAll);
+    Load("N\nA x Waist 0\nB x Head 0\n");
+    const struct
+    {
+        const char* what;
+        const char* selected; // digits
+        bool remove;
+        bool boneOffset;
+    } rows[] = {
+        {"none",           "",   false, false},
+        {"one",            "1",  true,  true },
+        {"two",            "01", true,  false},
+        {"a fixed one",    "2",  false, true },
+        {"one among them", "03", false, false},
+    };
+    for (const auto& row : rows)
+    {
+        m_kEditor.SelectOnlyRow(CMapRowTable::kNone);
+        for (const char digit : std::string_view(row.selected))
+            m_kEditor.SelectRow(digit - '0', true);
+        m_kEditor.UpdateButtons();
+        EXPECT_EQ(m_kEditor.Buttons().remove, row.remove) << row.what;
+        EXPECT_EQ(m_kEditor.Buttons().boneOffset, row.boneOffset) << row.what;
+        EXPECT_TRUE(m_kEditor.Buttons().removeAll) << row.what;
+    }
+}
+
+TEST_F(ProfileEditor, RemoveDoesNotCorrectItsIndices)
+{
+    m_kEditor.SetSourceScene(nullptr);
+    Load("N\nA x t0 0\nA x t1 0\nA x t2 0\nA x t3 0\nA x t4 0\n");
+    m_kEditor.SelectRow(0, true);
+    m_kEditor.SelectRow(2, true);
+    m_kEditor.UpdateButtons();
+    m_kEditor.ClickButton(kRemoveButton);
+    EXPECT_EQ(m_kEditor.Rows().Text(0, kTargetColumn), "t1");
+    EXPECT_EQ(m_kEditor.Rows().Text(1, kTargetColumn), "t2") << "selected, and spared";
+    EXPECT_EQ(m_kEditor.Rows().Text(2, kTargetColumn), "t4") << "t3 went in its place";
+
+    m_kEditor.SelectOnlyRow(0);
+    m_kEditor.SelectRow(4, true);
+    m_kEditor.RemoveSelection();
+    EXPECT_EQ(m_kEditor.Rows().RowCount(), 4) << "an index behind the end removes nothing";
+}
+
+TEST_F(ProfileEditor, RemovedRowsFreeTheirBones)
+{
+    Load("N\nA x Waist 0\nB x Head 0\n");
+    m_kEditor.SelectOnlyRow(0);
+    m_kEditor.ClickRow(0);
+    std::string bone;
+    EXPECT_TRUE(m_kEditor.GetSelectedSourceBone(bone));
+    EXPECT_EQ(bone, "A");
+    m_kEditor.ClickButton(kRemoveButton);
+    EXPECT_TRUE(m_kEditor.IsDirty());
+    EXPECT_TRUE(m_kEditor.Buttons().addToMap) << "the bones of the row are still selected";
+    m_kEditor.ClickButton(kRemoveAllButton);
+    EXPECT_EQ(m_kEditor.Rows().RowCount(), 0);
+    EXPECT_FALSE(m_kEditor.IsDirty()) << "an emptied table needs no saving";
+    EXPECT_FALSE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("B")));
+    EXPECT_FALSE(m_kEditor.Buttons().removeAll);
+    m_kEditor.ClickRow(-1);
+    EXPECT_FALSE(m_kEditor.GetSelectedTargetBone(bone));
+    EXPECT_EQ(bone, "");
+}
+
+TEST_F(ProfileEditor, BoneOffsetChangesTheSelectedRow)
+{
+    Load("N\nA x Waist 1,2,3\nB x Head 4,5,6,-1,3,2\n");
+    EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "nothing is selected";
+    m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog& dialog) {
+        dialog.LeaveRotation(0, "70");
+        dialog.ChooseAxis(0, 5);
+        return true;
+    };
+    m_kEditor.SelectOnlyRow(1);
+    m_kEditor.DoubleClickRow(1);
+    EXPECT_EQ(RowText(m_kEditor.Rows(), 1), "B|Head|70|5|6|-Z|-X| Y");
+    EXPECT_TRUE(m_kEditor.Buttons().saveProfile);
+
+    m_kEditor.SelectOnlyRow(0);
+    EXPECT_TRUE(m_kEditor.EditBoneOffset());
+    EXPECT_EQ(RowText(m_kEditor.Rows(), 0), "A|Waist|1|2|3|-Z| Y| X") << "the first row keeps its rotation";
+
+    Load("N\nA x Waist 1,2,3\n");
+    m_kEditor.SelectOnlyRow(0);
+    m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog&) { return true; };
+    EXPECT_TRUE(m_kEditor.EditBoneOffset());
+    EXPECT_FALSE(m_kEditor.IsDirty()) << "equal numbers are no change";
+    m_kOwner.m_kBoneOffset = nullptr;
+    EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "cancelled";
+}
+
+} // namespace gw

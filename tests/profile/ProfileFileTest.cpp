@@ -1,0 +1,180 @@
+// The profile file as text: what its lines say, and what the reader makes of lines that say too little.
+#include "ProfileFixture.h"
+
+#include <random>
+
+namespace gw {
+
+namespace {
+
+// A line as "12 source>target 1,2,3 4,5,6", "12 rate 30" or "12 at 1,2,3", with its number in the file.
+std::string Describe(const CProfileLine& line)
+{
+    const auto three = [](auto a, auto b, auto c) {
+        return std::to_string(int(a)) + ',' + std::to_string(int(b)) + ',' + std::to_string(int(c));
+    };
+    const std::string number = std::to_string(line.line) + ' ';
+    if (line.kind == EProfileLine::FrameRate)
+        return number + "rate " + std::to_string(line.frameRate);
+    if (line.kind == EProfileLine::Position)
+        return number + "at " + three(line.position.x, line.position.y, line.position.z);
+    const auto& [rotation, axes] = line.numbers;
+    return number + line.source + '>' + line.target + ' ' + three(rotation[0], rotation[1], rotation[2]) +
+           ' ' + three(axes[0], axes[1], axes[2]);
+}
+
+// All lines behind the name, with "; " behind each.
+std::string ReadAll(std::string_view text)
+{
+    CProfileReader reader(text);
+    std::string lines;
+    CProfileLine line;
+    while (reader.Next(line))
+        lines += Describe(line) + "; ";
+    return lines;
+}
+
+} // namespace
+
+TEST(ProfileReader, LinesSayWhatTheirFormSays)
+{
+    const struct
+    {
+        const char* what;
+        std::string text;
+        std::string lines;
+    } rows[] = {
+        {"nothing but a name",               "Only a name",                          ""                                            },
+        {"a name and its end",               "Name\n",                               ""                                            },
+        {"keywords in any case",             "N\nFRAMERATE 60\nposition 1 -2 3.9\n", "2 rate 60; 3 at 1,-2,3; "                    },
+        {"a whole mapping row",              "N\nA <---> Head 1,-2,3,-3,2,1\n",      "2 A>Head 1,-2,3 -3,2,1; "                    },
+        {"any second token",                 "N\nA = Head 1,2,3,1,2,3\n",            "2 A>Head 1,2,3 1,2,3; "                      },
+        {"one number alone is a rotation X", "N\nA <---> B 10\n",                    "2 A>B 10,0,0 1,2,3; "                        },
+        {"rotation without axes",            "N\nA <---> B 10,20,30\n",              "2 A>B 10,20,30 1,2,3; "                      },
+        {"some of the axes",                 "N\nA <---> B 1,2,3,-2\n",              "2 A>B 1,2,3 -2,2,3; "                        },
+        {"dotted mapping row",               "N\nA <---> B .-1,3,2\n",               "2 A>B 0,0,0 -1,3,2; "                        },
+        {"a dot alone",                      "N\nA <---> B .\n",                     "2 A>B 0,0,0 1,2,3; "                         },
+        {"a comma first ends the list",      "N\nA <---> B 5,,7,1\n",                "2 A>B 5,0,0 1,2,3; "                         },
+        {"words are 0",                      "N\nA <---> B x,y,z\n",                 "2 A>B 0,0,0 1,2,3; "                         },
+        {"dotted fixed row",                 "N\n* Head . .-1,3,2\n",                "2 [FIXED]>Head 0,0,0 -1,3,2; "               },
+        {"undotted fixed row",               "N\n* Head . 4,5,6,3,2,1\n",            "2 [FIXED]>Head 4,5,6 3,2,1; "                },
+        {"a blank line repeats",             "N\nA <---> B 1,2,3\n\n",               "2 A>B 1,2,3 1,2,3; 3 A>B 1,2,3 1,2,3; "      },
+        {"a short line borrows the tail",    "N\nA <---> B 9\nC <--->\n",
+         "2 A>B 9,0,0 1,2,3; 3 C>B 9,0,0 1,2,3; "                                                                                  },
+        {"a fixed row borrows too",          "N\nA <---> B 9\n* C\n",                "2 A>B 9,0,0 1,2,3; 3 [FIXED]>C 9,0,0 1,2,3; "},
+        {"nothing to borrow yet",            "N\n\n",                                "2 > 0,0,0 1,2,3; "                           },
+        {"CR LF, no last line end",          "N\r\nFrameRate 60\r\nA x B 1",         "2 rate 60; 3 A>B 1,0,0 1,2,3; "              },
+        {"a byte order mark",                "\xef\xbb\xbfN\nFrameRate 60\n",        "2 rate 60; "                                 },
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(ReadAll(row.text), row.lines) << row.what;
+}
+
+TEST(ProfileReader, BuffersCutLinesAndTokens)
+{
+    const std::string upTo1024(1017, ' '); // what "A x B 1" lacks
+    const std::string b300(300, 'B');
+    EXPECT_EQ(ReadAll("N\nA x B 1" + upTo1024 + "\n"), "2 A>B 1,0,0 1,2,3; ") << "not a blank line more";
+    EXPECT_EQ(ReadAll("N\nA x B 1" + upTo1024 + "C x D 2\n"), "2 A>B 1,0,0 1,2,3; 2 C>D 2,0,0 1,2,3; ");
+    EXPECT_EQ(ReadAll("N\nA x " + b300 + " 1\n"), "2 A>" + b300.substr(0, 255) + " 1,0,0 1,2,3; ");
+    EXPECT_EQ(ReadAll(std::string("N\nA x B 1\0,2\nFrameRate 9\n", 24)), "2 A>B 1,0,0 1,2,3; 3 rate 9; ");
+}
+
+TEST(ProfileReader, NameIsTheFirstLineWithoutItsEnd)
+{
+    const CTempFolder folder;
+    const struct
+    {
+        const char* what;
+        std::string text;
+        std::string name;
+    } rows[] = {
+        {"blanks inside stay, those at the end go", "My own  one \t \r\nFrameRate 30\n", "My own  one"},
+        {"byte order mark",                         "\xef\xbb\xbfName\n",                "Name"       },
+        {"empty file",                              "",                                  ""           },
+        {"empty line",                              "\nFrameRate 30\n",                  ""           },
+    };
+    for (const auto& row : rows)
+    {
+        WriteBytes(folder.Path("a.prf"), row.text);
+        EXPECT_EQ(ReadProfileName(folder.Path("a.prf")), row.name) << row.what;
+    }
+    WriteBytes(folder.Path("a.prf"), std::string(5000, 'n'));
+    EXPECT_EQ(ReadProfileName(folder.Path("a.prf")), std::string(1024, 'n')) << "rubbish without a line end";
+    EXPECT_EQ(ReadProfileName(folder.Path("none.prf")), "");
+    EXPECT_EQ(ReadProfileName(folder.Path("")), "") << "a folder";
+}
+
+TEST(ProfileReader, EveryPrefixAndRubbishIsReadToItsEnd)
+{
+    const std::string whole =
+        "\xef\xbb\xbfN\r\nFrameRate 60\nPosition 1 2 3\nA <---> B 1,2,3,-3,2,1\n* C . .1,2,3\n";
+    for (size_t size = 0; size <= whole.size(); ++size)
+    {
+        const std::vector<char> cut(whole.begin(),
+                                    whole.begin() + std::ptrdiff_t(size)); // a block of its own
+        EXPECT_LE(ReadAll({cut.data(), cut.size()}).size(), 200u);
+    }
+    std::mt19937 random(7);
+    for (int round = 0; round < 200; ++round)
+    {
+        std::string bytes(random() % 4000, '\0');
+        for (char& byte : bytes)
+            byte = random() % 8 == 0 ? "\n,.* \r0"[random() % 7] : char(random());
+        EXPECT_EQ(ReadAll(bytes).empty(), bytes.find('\n') == bytes.npos);
+    }
+    EXPECT_EQ(ReadAll("N\nA x B 99999999999999999999,-99999999999999999999\n"),
+              "2 A>B 2147483647,-2147483648,0 1,2,3; ");
+}
+
+TEST(ProfileReader, TextThatIsNoProfileIsRefused)
+{
+    const CTempFolder folder;
+    std::string text = "untouched";
+    WriteBytes(folder.Path("long.prf"), std::string(kProfileByteLimit + 1, ' '));
+    for (const char* name : {"long.prf", "none.prf", ""})
+        EXPECT_FALSE(ReadProfileText(folder.Path(name), text)) << name;
+    EXPECT_EQ(text, "untouched");
+}
+
+TEST(AxisCodes, TextsAndCodesAreTwoSidesOfOneTable)
+{
+    const struct
+    {
+        std::string_view text;
+        int code;
+    } rows[] = {
+        {" X", 1 },
+        {"-X", -1},
+        {" Y", 2 },
+        {"-Y", -2},
+        {" Z", 3 },
+        {"-Z", -3}
+    };
+    for (const auto& row : rows)
+    {
+        EXPECT_EQ(AxisCodeOf(row.text), row.code);
+        EXPECT_EQ(AxisText(row.code), row.text);
+    }
+    EXPECT_EQ(AxisCodeOf("-z"), -3) << "case does not count";
+    for (const std::string_view other : {"X", "", "+X", " X ", "  X"})
+        EXPECT_EQ(AxisCodeOf(other), 0) << other;
+    for (const int other : {0, 4, -4, 1000000, -2147483647 - 1})
+        EXPECT_EQ(AxisText(other), "") << other;
+}
+
+TEST(AxisCodes, MatrixHasOneColumnForEachRow)
+{
+    EXPECT_EQ(AxisMatrix(kNeutralAxes), kMat3Identity);
+    EXPECT_EQ(AxisMatrix({
+                  -1, 3, 2
+    }),
+              (Mat3{{-1, 0, 0, 0, 0, 1, 0, 1, 0}}));
+    EXPECT_EQ(AxisMatrix({
+                  1, -3, 3
+    }),
+              (Mat3{{1, 0, 0, 0, 0, -1, 0, 0, 1}}))
+        << "no check rejects two equal axes";
+}
+
+} // namespace gw

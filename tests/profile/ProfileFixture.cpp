@@ -1,0 +1,96 @@
+#include "ProfileFixture.h"
+
+#include "Paths.h"
+#include "Text.h"
+
+#include <filesystem>
+
+namespace gw {
+
+EAnswer CScriptedOwner::ShowMessage(int id, EButtons, std::span<const int> numbers)
+{
+    std::string message = std::to_string(id);
+    for (const int number : numbers)
+        message += ' ' + std::to_string(number);
+    m_kMessages.push_back(message);
+    return m_eAnswer;
+}
+
+std::string CScriptedOwner::FindProfilePath(const std::string& name)
+{
+    for (const std::string& file : FilesInFolder(ProfileFile(""), ".prf"))
+    {
+        if (EqualNoCase(ReadProfileName(ProfileFile(file)), name))
+            return ProfileFile(file);
+    }
+    return {};
+}
+
+bool CScriptedOwner::RunBoneOffset(CBoneOffsetDialog& dialog)
+{
+    return m_kBoneOffset && m_kBoneOffset(dialog);
+}
+
+Ref<CNode> MakeChain(const std::vector<std::string>& names)
+{
+    Ref<CNode> root;
+    CNode* parent = nullptr;
+    for (const std::string& name : names)
+    {
+        Ref<CNode> bone(new CNode);
+        bone->SetName(name.c_str());
+        if (parent)
+            parent->AttachChild(bone.Get());
+        else
+            root = bone;
+        parent = bone.Get();
+    }
+    return root;
+}
+
+std::string RowText(const CMapRowTable& rows, int row)
+{
+    std::string text = rows.Text(row, 0);
+    for (int column = 1; column < kMapColumnCount; ++column)
+        text += '|' + rows.Text(row, column);
+    return text;
+}
+
+std::vector<std::string> RowTexts(const CMapRowTable& rows)
+{
+    std::vector<std::string> texts;
+    for (int row = 0; row < rows.RowCount(); ++row)
+        texts.push_back(RowText(rows, row));
+    return texts;
+}
+
+ProfileEditor::ProfileEditor()
+    : m_spkSource(MakeChain({"A", "B", "C"})),
+      m_spkTarget(MakeChain({"LowerTorso", "Waist", "Head", "LPelvis", "RPelvis"}))
+{
+    m_kEditor.SetSourceScene(m_spkSource.Get());
+    m_kEditor.SetTargetScene(m_spkTarget.Get());
+    m_kEditor.SetResultScene(m_spkTarget.Get());
+    m_kEditor.SetNamesInUse(&m_kNamesInUse);
+}
+
+std::string ProfileEditor::MakeProfile(const std::string& text, const std::string& name)
+{
+    const std::string path = m_kOwner.ProfileFile(name);
+    WriteBytes(path, text);
+    return path;
+}
+
+void ProfileEditor::MakeReadOnly(const std::string& path)
+{
+    namespace fs = std::filesystem;
+    fs::permissions(path, fs::perms::owner_read);
+}
+
+void ProfileEditor::SelectBones(const std::string& source, const std::string& target)
+{
+    m_kEditor.SelectSourceItem(m_kEditor.FindSourceItem(source));
+    m_kEditor.SelectTargetItem(m_kEditor.FindTargetItem(target));
+}
+
+} // namespace gw

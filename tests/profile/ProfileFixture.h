@@ -1,0 +1,68 @@
+#pragma once
+
+#include "CBoneOffsetDialog.h"
+#include "CNode.h"
+#include "CProfileEditorDialog.h"
+#include "TempFolder.h"
+
+#include <functional>
+#include <gtest/gtest.h>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// A program around the editor that answers from a script and records what it was asked. Its two profile
+/// folders lie in one temporary folder.
+class CScriptedOwner : public CProfileOwner
+{
+public:
+    EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers) override;
+    void ProfileStateChanged() override { ++m_iStateChanges; }
+    void ProfileSetChanged() override { ++m_iSetChanges; }
+    std::string FindProfilePath(const std::string& name) override;
+    std::string ProfileFile(const std::string& name) override { return m_kFolder.Path(name); }
+    std::string ExeFile(const std::string& name) override { return m_kFolder.Path(name); }
+    bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
+
+    /// The messages shown since the last call, as "157 OK -10000 10000".
+    std::vector<std::string> TakeMessages() { return std::exchange(m_kMessages, {}); }
+
+    CTempFolder m_kFolder;
+    EAnswer m_eAnswer = EAnswer::OK;
+    std::function<bool(CBoneOffsetDialog&)> m_kBoneOffset; ///< what the user does in the offset dialog
+    int m_iStateChanges = 0;
+    int m_iSetChanges = 0;
+
+private:
+    std::vector<std::string> m_kMessages;
+};
+
+/// A chain of bones, each the parent of the next.
+Ref<CNode> MakeChain(const std::vector<std::string>& names);
+
+/// A row as "source|target|rx|ry|rz|x|y|z".
+std::string RowText(const CMapRowTable& rows, int row);
+std::vector<std::string> RowTexts(const CMapRowTable& rows);
+
+/// An editor in a program, with a source of bones A, B, C and a target of LowerTorso, Waist, Head and the
+/// pelvis bones.
+class ProfileEditor : public testing::Test
+{
+protected:
+    ProfileEditor();
+    /// Writes a profile file and answers its path.
+    std::string MakeProfile(const std::string& text, const std::string& name = "Test.prf");
+    /// Writes and loads one.
+    bool Load(const std::string& text) { return m_kEditor.LoadProfile(MakeProfile(text)); }
+    void MakeReadOnly(const std::string& path);
+    void SelectBones(const std::string& source, const std::string& target);
+
+    CScriptedOwner m_kOwner;
+    Ref<CNode> m_spkSource;
+    Ref<CNode> m_spkTarget;
+    std::vector<std::string> m_kNamesInUse;
+    CProfileEditorDialog m_kEditor{m_kOwner};
+};
+
+} // namespace gw
