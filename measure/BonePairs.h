@@ -1,7 +1,9 @@
 #pragma once
 
 #include <cstddef>
+#include <span>
 #include <string>
+#include <unordered_map>
 #include <vector>
 
 namespace gw {
@@ -30,5 +32,18 @@ struct PairMisfit
 /// changed, when the profile cannot be read.
 bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
                    std::vector<BonePair>& pairs, std::vector<PairMisfit>& misfits);
+
+/// Pairs by target.
+class CSourceTable
+{
+public:
+    explicit CSourceTable(std::span<const BonePair> pairs);
+
+    /// The source of a target bone, or null.
+    CNode* SourceOf(const CNode* target) const;
+
+private:
+    std::unordered_map<const CNode*, CNode*> m_kSource;
+};
 
 } // namespace gw

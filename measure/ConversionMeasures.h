@@ -10,11 +10,14 @@ namespace gw {
 // What a conversion did to a motion, in figures. Frames are the source's; the result is sampled at the same
 // instants. World space with y up on both sides. Angles are degrees. A length is given in the result's unit
 // (mm) or, where source and result stand side by side, in leg lengths of its own skeleton: thigh to knee to
-// ankle at frame 0, both legs' mean. A ratio is result by source and missing where the source's figure is 0.
+// ankle at frame 0, both legs' mean. A ratio is result by source and missing where the source's figure is 0
+// but for rounding.
 
 /// How one mapped bone points. The direction of a bone is that from its joint to the next joint below that is
-/// not at the same place: towards the nearest mapped bone below (the first one in the tree's order), else
-/// along the first child. Source and result each take a joint on the way to the same mapped bone.
+/// not at the same place: towards the nearest mapped bone below, else along the first child. Where a bone
+/// branches into several mapped ones, the branch counts that leaves least sideways (x) in the result's rest
+/// pose: the spine for a hip, the neck for a chest. Source and result each take a joint on the way to the
+/// same mapped bone.
 struct BoneMeasures
 {
     std::string target;      ///< bone of the result
@@ -42,7 +45,7 @@ struct FootMeasures
 
     /// Turn: the angle about y from the source foot's heading to the result's, -180 to 180. A foot's heading
     /// is its direction from ankle to toe, seen from above; frames in which a foot points up or down within
-    /// 10 degrees are left out. A foot without a toe joint heads along that axis of its own which lies along
+    /// 30 degrees are left out. A foot without a toe joint heads along that axis of its own which lies along
     /// the other foot at frame 0, so that turns count from there: see `turnFromStart`.
     double turnMean = 0.0;          ///< signed mean over the frames; positive turns z towards x
     double turnError = 0.0;         ///< mean of its absolute value
@@ -85,7 +88,7 @@ struct FootMeasures
 /// All figures of one conversion.
 struct ConversionMeasures
 {
-    int frameCount = 0;      ///< frames compared: those of the source
+    int frameCount = 0;      ///< frames compared: those of the source up to the result's last
     double frameScale = 1.0; ///< frames of the result to one of the source
     double sourceLeg = 0.0;  ///< leg length, in the source's unit; 0 without a mapped leg
     double resultLeg = 0.0;  ///< leg length, in the result's unit
@@ -102,13 +105,16 @@ struct ConversionMeasures
     /// 2 both / (source + result) over all feet.
     std::optional<double> contactF1;
 
-    /// Height of the ground that the result stands on, against y = 0, mm: a low percentile of the soles'
-    /// heights. A sole is what lies on the floor under ankle and toe in the rest pose.
-    double floorHeight = 0.0;
-    /// 95th percentile over all frames of the depth of the lowest sole point below y = 0, mm; 0 above it.
+    /// Where the result stands, against y = 0, mm: the median of a sole's height over the frames of the
+    /// result's contacts, missing where it never stands. A sole is what lies on the floor under ankle and toe
+    /// in the rest pose, and its height is that of its lower end.
+    std::optional<double> floorHeight;
+    /// 95th percentile over all frames of the depth of the lowest sole below y = 0, mm; 0 where it is not
+    /// below.
     double sinkDepth = 0.0;
 
-    /// Path of the root's bone over the ground (x and z), summed over the frames, in leg lengths.
+    /// Path over the ground (x and z) of the result's root and of its source bone, summed over the frames, in
+    /// leg lengths; 0 where the root is not mapped.
     double sourceTravel = 0.0;
     double resultTravel = 0.0;
     std::optional<double> travelRatio;

@@ -21,11 +21,6 @@ struct MotionClip
 /// The motion of a loaded file, which must outlive the clip.
 MotionClip ClipOf(const CMotionFile& file);
 
-/// How many frames a result has for one of its source. It is 120 / rate for a whole rate where that gives the
-/// result's frame count (a count is cut to an integer, so the counts alone would let a long motion drift),
-/// else the quotient of the counts.
-double FrameScaleOf(int sourceFrames, int resultFrames);
-
 /// Measures a conversion at every frame of the source; frame f there is frame f x FrameScaleOf(...) of the
 /// result. Both trees are posed and stay as the last frame left them. A clip without a root or frames gives a
 /// record without figures.

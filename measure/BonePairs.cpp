@@ -1,0 +1,58 @@
+#include "BonePairs.h"
+
+#include "FindBone.h"
+#include "ProfileFile.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+void SetPair(std::vector<BonePair>& pairs, const BonePair& pair)
+{
+    const auto known = std::ranges::find(pairs, pair.target, &BonePair::target);
+    if (known == pairs.end())
+        pairs.push_back(pair);
+    else
+        known->source = pair.source;
+}
+
+} // namespace
+
+bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
+                   std::vector<BonePair>& pairs, std::vector<PairMisfit>& misfits)
+{
+    std::string text;
+    if (!ReadProfileText(profilePath, text))
+        return false;
+    const CBoneNames sources(sourceRoot);
+    const CBoneNames targets(resultRoot);
+    CProfileReader reader(text);
+    for (CProfileLine line; reader.Next(line);)
+    {
+        if (line.kind != EProfileLine::Mapping)
+            continue;
+        const BonePair pair{targets.Find(line.target), sources.Find(line.source)};
+        if (pair.target && pair.source)
+            SetPair(pairs, pair);
+        else
+            misfits.push_back(
+                {line.line, line.source, line.target, pair.source != nullptr, pair.target != nullptr});
+    }
+    return true;
+}
+
+CSourceTable::CSourceTable(std::span<const BonePair> pairs)
+{
+    for (const BonePair& pair : pairs)
+        m_kSource[pair.target] = pair.source;
+}
+
+CNode* CSourceTable::SourceOf(const CNode* target) const
+{
+    const auto found = m_kSource.find(target);
+    return found == m_kSource.end() ? nullptr : found->second;
+}
+
+} // namespace gw

@@ -1,0 +1,172 @@
+#include "CFeetMeter.h"
+
+#include "CNode.h"
+#include "Figures.h"
+#include "MeasureFoot.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr double kMedian = 0.5;
+constexpr double kSinkShare = 0.05; // what sinks deeper in fewer frames is an outlier
+
+std::vector<LegJoints> LegsOf(const std::vector<LegPair>& pairs, LegJoints LegPair::*side)
+{
+    std::vector<LegJoints> legs;
+    for (const LegPair& pair : pairs)
+        legs.push_back(pair.*side);
+    return legs;
+}
+
+// The height on which a joint of all feet stands.
+float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const)
+{
+    std::vector<float> heights;
+    for (const CLegTrack& leg : legs)
+        std::ranges::transform((leg.*joint)(), std::back_inserter(heights), &Vec3::y);
+    return Percentile(std::move(heights), kFloorShare);
+}
+
+// A foot without a toe joint takes its heading from the other side.
+void LendHeading(CLegTrack& source, CLegTrack& result)
+{
+    if (!result.HasToe())
+        result.SetHeading(source.HasToe() ? source.Heading() : kVec3UnitZ);
+    if (!source.HasToe())
+        source.SetHeading(result.Heading());
+}
+
+std::optional<double> FloorHeight(const CFeetTrack& feet, const std::vector<std::vector<Contact>>& contacts)
+{
+    std::vector<float> heights;
+    for (size_t leg = 0; leg < contacts.size(); ++leg)
+    {
+        const auto& postures = feet.Legs()[leg].Postures();
+        for (const Contact& contact : contacts[leg])
+            std::transform(postures.begin() + contact.first, postures.begin() + contact.end,
+                           std::back_inserter(heights),
+                           [](const auto& posture) { return posture.soleHeight; });
+    }
+    if (heights.empty())
+        return std::nullopt;
+    return static_cast<double>(Percentile(std::move(heights), kMedian));
+}
+
+double SinkDepth(const std::vector<CLegTrack>& legs)
+{
+    std::vector<float> lowest;
+    for (size_t f = 0; !legs.empty() && f < legs[0].Postures().size(); ++f)
+    {
+        const auto height = [=](const CLegTrack& leg) { return leg.Postures()[f].soleHeight; };
+        lowest.push_back(height(*std::ranges::min_element(legs, {}, height)));
+    }
+    return std::max(0.0, -static_cast<double>(Percentile(std::move(lowest), kSinkShare)));
+}
+
+std::optional<double> CommonF1(const std::vector<FootMeasures>& feet)
+{
+    size_t both = 0;
+    size_t standing = 0;
+    for (const FootMeasures& foot : feet)
+    {
+        both += foot.bothStanding;
+        standing += foot.sourceStanding + foot.resultStanding;
+    }
+    return RatioOf(2.0 * static_cast<double>(both), static_cast<double>(standing));
+}
+
+} // namespace
+
+CFeetTrack::CFeetTrack(const std::vector<LegJoints>& legs)
+{
+    const double floor = RestFloor(legs);
+    for (const LegJoints& leg : legs)
+        m_kLegs.emplace_back(leg, floor);
+}
+
+void CFeetTrack::WatchJoints(CPoseSampler& sampler) const
+{
+    for (const CLegTrack& leg : m_kLegs)
+        leg.WatchJoints(sampler);
+}
+
+void CFeetTrack::Append()
+{
+    for (CLegTrack& leg : m_kLegs)
+        leg.Append();
+}
+
+void CFeetTrack::MeasureLegs()
+{
+    CRunningMean lengths;
+    for (const CLegTrack& leg : m_kLegs)
+        lengths.Add(leg.Length());
+    m_fLegLength = lengths.Mean();
+}
+
+std::vector<std::vector<Contact>> CFeetTrack::Contacts(double secondsPerFrame) const
+{
+    const float ankleFloor = FloorOf(m_kLegs, &CLegTrack::Ankles);
+    const float toeFloor = FloorOf(m_kLegs, &CLegTrack::Toes);
+    std::vector<std::vector<Contact>> contacts;
+    for (const CLegTrack& leg : m_kLegs)
+    {
+        std::vector<FloorPath> joints{
+            {leg.Ankles(), ankleFloor}
+        };
+        if (leg.HasToe())
+            joints.push_back({leg.Toes(), toeFloor});
+        contacts.push_back(FindContacts(joints, m_fLegLength, secondsPerFrame));
+    }
+    return contacts;
+}
+
+CFeetMeter::CFeetMeter(std::vector<LegPair> legs)
+    : m_kPairs(std::move(legs)), m_kSource(LegsOf(m_kPairs, &LegPair::source)),
+      m_kResult(LegsOf(m_kPairs, &LegPair::result))
+{
+}
+
+void CFeetMeter::WatchJoints(CPoseSampler& source, CPoseSampler& result) const
+{
+    m_kSource.WatchJoints(source);
+    m_kResult.WatchJoints(result);
+}
+
+void CFeetMeter::Begin()
+{
+    m_kSource.MeasureLegs();
+    m_kResult.MeasureLegs();
+    for (size_t i = 0; i < m_kPairs.size(); ++i)
+        LendHeading(m_kSource.Legs()[i], m_kResult.Legs()[i]);
+}
+
+void CFeetMeter::Add()
+{
+    m_kSource.Append();
+    m_kResult.Append();
+}
+
+void CFeetMeter::Write(ConversionMeasures& measures, double secondsPerFrame) const
+{
+    const auto sourceContacts = m_kSource.Contacts(secondsPerFrame);
+    const auto resultContacts = m_kResult.Contacts(secondsPerFrame);
+    for (size_t i = 0; i < m_kPairs.size(); ++i)
+    {
+        FootMeasures foot = MeasureFoot({m_kSource.Legs()[i], sourceContacts[i], SourceLeg()},
+                                        {m_kResult.Legs()[i], resultContacts[i], ResultLeg()});
+        foot.target = m_kPairs[i].ankles.target->NameView();
+        foot.source = m_kPairs[i].ankles.source->NameView();
+        measures.feet.push_back(std::move(foot));
+    }
+    measures.sourceLeg = SourceLeg();
+    measures.resultLeg = ResultLeg();
+    measures.contactF1 = CommonF1(measures.feet);
+    measures.floorHeight = FloorHeight(m_kResult, resultContacts);
+    measures.sinkDepth = SinkDepth(m_kResult.Legs());
+}
+
+} // namespace gw

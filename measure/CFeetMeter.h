@@ -1,0 +1,60 @@
+#pragma once
+
+#include "ConversionMeasures.h"
+#include "FindContacts.h"
+#include "Legs.h"
+
+#include <vector>
+
+namespace gw {
+
+class CPoseSampler;
+
+/// The feet of one skeleton while frames go by.
+class CFeetTrack
+{
+public:
+    explicit CFeetTrack(const std::vector<LegJoints>& legs);
+
+    void WatchJoints(CPoseSampler& sampler) const;
+    /// Takes the present pose as the next frame.
+    void Append();
+    /// Takes the present pose for how long the legs are.
+    void MeasureLegs();
+
+    std::vector<CLegTrack>& Legs() { return m_kLegs; }
+    const std::vector<CLegTrack>& Legs() const { return m_kLegs; }
+    /// The legs' mean length, or 0 without legs.
+    double LegLength() const { return m_fLegLength; }
+    /// The contacts of each leg.
+    std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
+
+private:
+    std::vector<CLegTrack> m_kLegs;
+    double m_fLegLength = 0.0;
+};
+
+/// The feet of a conversion while frames go by.
+class CFeetMeter
+{
+public:
+    /// Both trees are posed.
+    explicit CFeetMeter(std::vector<LegPair> legs);
+
+    void WatchJoints(CPoseSampler& source, CPoseSampler& result) const;
+    /// Takes the present pose as that of the first frame for lengths and headings.
+    void Begin();
+    /// Takes the present pose as the next frame.
+    void Add();
+    double SourceLeg() const { return m_kSource.LegLength(); }
+    double ResultLeg() const { return m_kResult.LegLength(); }
+    /// Enters all figures of legs and ground. `secondsPerFrame` is the source's.
+    void Write(ConversionMeasures& measures, double secondsPerFrame) const;
+
+private:
+    std::vector<LegPair> m_kPairs;
+    CFeetTrack m_kSource;
+    CFeetTrack m_kResult;
+};
+
+} // namespace gw

@@ -1,0 +1,110 @@
+#include "CLegTrack.h"
+
+#include "CPoseSampler.h"
+#include "Figures.h"
+
+namespace gw {
+
+namespace {
+
+Vec3 PlaceOf(const CNode& node)
+{
+    return node.m_kWorldMatrix.Translation();
+}
+
+// A world direction in the space of a node with a world matrix, and back.
+Vec3 ToLocal(const Vec3& direction, const Mat4& world)
+{
+    const Mat3 rows = NormalizedRows(world);
+    return {static_cast<float>(Vec3Dot(direction, rows.Row(0))),
+            static_cast<float>(Vec3Dot(direction, rows.Row(1))),
+            static_cast<float>(Vec3Dot(direction, rows.Row(2)))};
+}
+
+Vec3 ToWorld(const Vec3& direction, const Mat4& world)
+{
+    const Mat3 rows = NormalizedRows(world);
+    return rows.Row(0) * direction.x + rows.Row(1) * direction.y + rows.Row(2) * direction.z;
+}
+
+// What lies on the floor under a joint in the rest pose, in the joint's space.
+Vec3 SoleUnder(const CNode& joint, double restFloor)
+{
+    const Mat4 world = RestWorld(joint);
+    Vec3 point = world.Translation();
+    point.y = static_cast<float>(restFloor);
+    return TransformCoord(point, Mat4InverseOrIdentity(world));
+}
+
+} // namespace
+
+CLegTrack::CLegTrack(const LegJoints& joints, double restFloor)
+    : m_kJoints(joints), m_kHeelSole(SoleUnder(*joints.ankle, restFloor)),
+      m_kSoleNormal(ToLocal(kVec3UnitY, RestWorld(*joints.ankle)))
+{
+    if (HasToe())
+        m_kToeSole = SoleUnder(*joints.toe, restFloor);
+}
+
+void CLegTrack::WatchJoints(CPoseSampler& sampler) const
+{
+    for (CNode* joint : {m_kJoints.thigh, m_kJoints.knee, m_kJoints.ankle, m_kJoints.toe})
+        sampler.Watch(joint);
+}
+
+double CLegTrack::Length() const
+{
+    const Vec3 knee = PlaceOf(*m_kJoints.knee);
+    return Vec3Length(knee - PlaceOf(*m_kJoints.thigh)) + Vec3Length(PlaceOf(*m_kJoints.ankle) - knee);
+}
+
+Vec3 CLegTrack::Heading() const
+{
+    if (HasToe())
+        return Vec3Normalized(PlaceOf(*m_kJoints.toe) - PlaceOf(*m_kJoints.ankle));
+    return ToWorld(m_kHeading, m_kJoints.ankle->m_kWorldMatrix);
+}
+
+void CLegTrack::SetHeading(const Vec3& direction)
+{
+    m_kHeading = ToLocal(direction, m_kJoints.ankle->m_kWorldMatrix);
+}
+
+float CLegTrack::SoleHeight() const
+{
+    const float heel = TransformCoord(m_kHeelSole, m_kJoints.ankle->m_kWorldMatrix).y;
+    return HasToe() ? std::min(heel, TransformCoord(m_kToeSole, m_kJoints.toe->m_kWorldMatrix).y) : heel;
+}
+
+void CLegTrack::Append()
+{
+    const Vec3 knee = PlaceOf(*m_kJoints.knee);
+    const Vec3 ankle = PlaceOf(*m_kJoints.ankle);
+    const Vec3 normal = ToWorld(m_kSoleNormal, m_kJoints.ankle->m_kWorldMatrix);
+    m_kAnkles.push_back(ankle);
+    if (HasToe())
+        m_kToes.push_back(PlaceOf(*m_kJoints.toe));
+    m_kPostures.push_back(
+        {Heading(), static_cast<float>(DegreesBetween(normal, kVec3UnitY)), SoleHeight(),
+         static_cast<float>(DegreesBetween(knee - PlaceOf(*m_kJoints.thigh), ankle - knee))});
+}
+
+double RestFloor(const std::vector<LegJoints>& legs)
+{
+    double lowest = 0.0;
+    double calf = 0.0;
+    for (size_t i = 0; i < legs.size(); ++i)
+    {
+        const Vec3 ankle = RestWorld(*legs[i].ankle).Translation();
+        const float toe = legs[i].toe ? RestWorld(*legs[i].toe).Translation().y : ankle.y;
+        const auto height = static_cast<double>(std::min(ankle.y, toe));
+        lowest = i == 0 ? height : std::min(lowest, height);
+        calf = std::max(calf, Vec3Length(ankle - RestWorld(*legs[i].knee).Translation()));
+    }
+    // An ankle is a fifth of the calf above the sole; a skeleton whose hip is the origin hangs two calves
+    // below it.
+    const bool stands = lowest >= 0.0 && lowest < 0.5 * calf;
+    return stands ? 0.0 : lowest;
+}
+
+} // namespace gw

@@ -1,0 +1,58 @@
+#include "CPoseSampler.h"
+
+#include "CKeyframeControl.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+const Mat4& RestLocal(const CNode& node)
+{
+    for (CControl* control = node.GetControl(); control; control = control->GetNext())
+    {
+        const CKeyframeControl* track = RecordCast<CKeyframeControl>(control);
+        if (track && track->m_bHasRestMatrix)
+            return track->m_kRestMatrix;
+    }
+    return node.m_kMatrix;
+}
+
+} // namespace
+
+bool IsFrameTime(float frequency)
+{
+    return std::isfinite(frequency) && frequency > 0.0f;
+}
+
+CPoseSampler::CPoseSampler(float frequency)
+    : m_fFrequency(IsFrameTime(frequency) ? static_cast<double>(frequency) : 1.0)
+{
+}
+
+void CPoseSampler::Watch(CNode* node)
+{
+    if (!node || !m_kWatched.insert(node).second)
+        return;
+    Watch(node->GetParentNode());
+    m_kNodes.push_back(node);
+}
+
+void CPoseSampler::Pose(double frame)
+{
+    const auto time = static_cast<float>(frame / m_fFrequency);
+    for (CNode* node : m_kNodes)
+        node->CSpatial::UpdateTransform(
+            time); // this node alone: a node's own operation goes on to its children
+}
+
+Mat4 RestWorld(const CNode& node)
+{
+    Mat4 world = RestLocal(node);
+    for (const CNode* parent = node.GetParentNode(); parent; parent = parent->GetParentNode())
+        world = world * RestLocal(*parent);
+    return world;
+}
+
+} // namespace gw

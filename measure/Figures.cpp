@@ -1,0 +1,30 @@
+#include "Figures.h"
+
+#include "Angles.h"
+
+#include <cmath>
+
+namespace gw {
+
+float Percentile(std::vector<float> values, double share)
+{
+    if (values.empty())
+        return 0.0f;
+    const auto last = static_cast<double>(values.size() - 1);
+    const auto rank = values.begin() + std::lround(std::clamp(share, 0.0, 1.0) * last);
+    std::nth_element(values.begin(), rank, values.end());
+    return *rank;
+}
+
+// By sine and cosine together: an arc cosine of floats knows no angle below a fiftieth of a degree.
+double DegreesBetween(const Vec3& a, const Vec3& b)
+{
+    return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;
+}
+
+double GroundDistance(const Vec3& a, const Vec3& b)
+{
+    return std::hypot(static_cast<double>(a.x - b.x), static_cast<double>(a.z - b.z));
+}
+
+} // namespace gw

@@ -1,0 +1,79 @@
+#include "FindContacts.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+// How high and how fast the joints of a foot are at most.
+class CFootState
+{
+public:
+    CFootState(std::span<const FloorPath> joints, double leg, double secondsPerFrame)
+        : m_kJoints(joints), m_fLeg(leg), m_fSecondsPerFrame(secondsPerFrame),
+          m_iSpan(std::max(1, static_cast<int>(std::lround(std::min(kSpeedSeconds / secondsPerFrame, 1e6)))))
+    {
+    }
+
+    int FrameCount() const { return m_kJoints.empty() ? 0 : static_cast<int>(m_kJoints[0].positions.size()); }
+    bool IsWithin(int frame, double height, double speed) const
+    {
+        return std::ranges::all_of(m_kJoints, [=, this](const FloorPath& joint) {
+            const double above = static_cast<double>(At(joint, frame).y - joint.floor);
+            return above < height * m_fLeg && Speed(joint, frame) < speed * m_fLeg;
+        });
+    }
+
+private:
+    static const Vec3& At(const FloorPath& joint, int frame)
+    {
+        return joint.positions[static_cast<size_t>(frame)];
+    }
+    double SpeedBetween(const FloorPath& joint, int from, int to) const
+    {
+        return Vec3Length(At(joint, to) - At(joint, from)) / (m_fSecondsPerFrame * (to - from));
+    }
+    // The slower of before and after: the first and the last frame of a stand belong to it.
+    double Speed(const FloorPath& joint, int frame) const
+    {
+        const int before = std::max(frame - m_iSpan, 0);
+        const int after = std::min(frame + m_iSpan, FrameCount() - 1);
+        if (before == frame && after == frame)
+            return 0.0;
+        if (before == frame || after == frame)
+            return SpeedBetween(joint, before, after);
+        return std::min(SpeedBetween(joint, before, frame), SpeedBetween(joint, frame, after));
+    }
+
+    std::span<const FloorPath> m_kJoints;
+    double m_fLeg;
+    double m_fSecondsPerFrame;
+    int m_iSpan;
+};
+
+} // namespace
+
+std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg, double secondsPerFrame)
+{
+    const CFootState foot(joints, leg, secondsPerFrame);
+    std::vector<Contact> contacts;
+    bool stands = false;
+    for (int frame = 0; frame < foot.FrameCount(); ++frame)
+    {
+        const bool stood = stands;
+        stands = stood ? foot.IsWithin(frame, kLeaveHeight, kLeaveSpeed)
+                       : foot.IsWithin(frame, kStandHeight, kStandSpeed);
+        if (stands && !stood)
+            contacts.push_back({frame, frame});
+        if (stands)
+            contacts.back().end = frame + 1;
+    }
+    std::erase_if(contacts, [=](const Contact& contact) {
+        return (contact.end - contact.first) * secondsPerFrame < kLeastContactSeconds;
+    });
+    return contacts;
+}
+
+} // namespace gw

@@ -1,0 +1,203 @@
+// How a conversion is measured: which joints are looked at is found once, in the pose of the first frame;
+// then both trees are posed frame by frame, the looked-at joints alone, and each meter takes what it needs.
+// Bones keep running sums. Feet keep a few numbers a frame, since where the floor is, and with it which
+// frames stand, is known at the end only.
+
+#include "MeasureConversion.h"
+
+#include "CBoneMeter.h"
+#include "CFeetMeter.h"
+#include "CMotionFile.h"
+#include "CPoseSampler.h"
+#include "FrameScale.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr double kUsualSecondsPerFrame = 1.0 / 30.0; // where a file gives no usable one
+// A motion that stands still has these by rounding alone: unit directions are good to 1e-7, positions to as
+// much of their distance from the origin, over thousands of frames.
+constexpr double kStillJitter = 1e-6;
+constexpr double kStillTravel = 1e-3;
+
+// The path of a root and of what drives it, over the ground, in the units of each side.
+class CTravelMeter
+{
+public:
+    CTravelMeter(const CNode* source, const CNode* result) : m_pkSource(source), m_pkResult(result) {}
+
+    void Add()
+    {
+        if (!m_pkSource)
+            return;
+        const Vec3 source = m_pkSource->m_kWorldMatrix.Translation();
+        const Vec3 result = m_pkResult->m_kWorldMatrix.Translation();
+        m_fSourcePath += m_bBegun ? GroundDistance(m_kLastSource, source) : 0.0;
+        m_fResultPath += m_bBegun ? GroundDistance(m_kLastResult, result) : 0.0;
+        m_kLastSource = source;
+        m_kLastResult = result;
+        m_bBegun = true;
+    }
+    void Write(ConversionMeasures& measures) const
+    {
+        if (measures.sourceLeg <= 0.0 || measures.resultLeg <= 0.0)
+            return;
+        measures.sourceTravel = m_fSourcePath / measures.sourceLeg;
+        measures.resultTravel = m_fResultPath / measures.resultLeg;
+        measures.travelRatio = RatioOf(measures.resultTravel, measures.sourceTravel, kStillTravel);
+    }
+
+private:
+    const CNode* m_pkSource;
+    const CNode* m_pkResult;
+    Vec3 m_kLastSource = kVec3Zero;
+    Vec3 m_kLastResult = kVec3Zero;
+    double m_fSourcePath = 0.0;
+    double m_fResultPath = 0.0;
+    bool m_bBegun = false;
+};
+
+BoneMeasures NamedBone(const BonePair& pair, const BoneEnds& ends)
+{
+    BoneMeasures bone;
+    bone.target = pair.target->NameView();
+    bone.source = pair.source->NameView();
+    bone.targetChild = ends.target ? ends.target->NameView() : "";
+    bone.sourceChild = ends.source ? ends.source->NameView() : "";
+    return bone;
+}
+
+// Both trees are posed at their first frame before one of these is made.
+class CComparison
+{
+public:
+    CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs);
+
+    void Run();
+    ConversionMeasures Measures() const;
+
+private:
+    void WatchPair(const BonePair& pair, const BoneEnds& ends);
+    void PlanBones(std::span<const BonePair> pairs);
+    void WriteBones(ConversionMeasures& measures) const;
+
+    double m_fFrameScale;
+    double m_fSecondsPerFrame;
+    int m_iFrameCount;
+    CSourceTable m_kSources;
+    CPoseSampler m_kSource;
+    CPoseSampler m_kResult;
+    std::vector<BoneMeasures> m_kBones;
+    std::vector<CBoneMeter> m_kMeters;   // of the bones that can be measured
+    std::vector<size_t> m_kMeteredBones; // which these are
+    CFeetMeter m_kFeet;
+    CTravelMeter m_kTravel;
+};
+
+CComparison::CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs)
+    : m_fFrameScale(FrameScaleOf(source.frameCount, result.frameCount)),
+      m_fSecondsPerFrame(IsFrameTime(source.frequency) ? source.frequency : kUsualSecondsPerFrame),
+      m_iFrameCount(ComparedFrames(source.frameCount, result.frameCount, m_fFrameScale)), m_kSources(pairs),
+      m_kSource(source.frequency), m_kResult(result.frequency), m_kFeet(FindLegs(pairs, m_kSources)),
+      m_kTravel(m_kSources.SourceOf(result.root), result.root)
+{
+    PlanBones(pairs);
+    m_kFeet.WatchJoints(m_kSource, m_kResult);
+    m_kFeet.Begin();
+}
+
+void CComparison::PlanBones(std::span<const BonePair> pairs)
+{
+    for (const BonePair& pair : pairs)
+    {
+        const BoneEnds ends = FindBoneEnds(pair, m_kSources);
+        WatchPair(pair, ends);
+        m_kBones.push_back(NamedBone(pair, ends));
+        if (!ends.target || !ends.source)
+            continue;
+        m_kMeters.emplace_back(pair, ends);
+        m_kMeteredBones.push_back(m_kBones.size() - 1);
+    }
+}
+
+void CComparison::WatchPair(const BonePair& pair, const BoneEnds& ends)
+{
+    m_kSource.Watch(pair.source);
+    m_kSource.Watch(ends.source);
+    m_kResult.Watch(pair.target);
+    m_kResult.Watch(ends.target);
+}
+
+void CComparison::Run()
+{
+    for (int frame = 0; frame < m_iFrameCount; ++frame)
+    {
+        m_kSource.Pose(frame);
+        m_kResult.Pose(frame * m_fFrameScale);
+        for (CBoneMeter& meter : m_kMeters)
+            meter.Add();
+        m_kFeet.Add();
+        m_kTravel.Add();
+    }
+}
+
+void CComparison::WriteBones(ConversionMeasures& measures) const
+{
+    measures.bones = m_kBones;
+    CRunningMean errors;
+    CRunningMean sourceJitter;
+    CRunningMean resultJitter;
+    for (size_t i = 0; i < m_kMeters.size(); ++i)
+    {
+        BoneMeasures& bone = measures.bones[m_kMeteredBones[i]];
+        m_kMeters[i].Write(bone);
+        errors.Add(bone.meanError);
+        sourceJitter.Add(bone.sourceJitter);
+        resultJitter.Add(bone.resultJitter);
+        measures.largestError = std::max(measures.largestError, bone.largestError);
+    }
+    measures.meanError = errors.Mean();
+    measures.sourceJitter = sourceJitter.Mean();
+    measures.resultJitter = resultJitter.Mean();
+    measures.jitterRatio = RatioOf(measures.resultJitter, measures.sourceJitter, kStillJitter);
+}
+
+ConversionMeasures CComparison::Measures() const
+{
+    ConversionMeasures measures;
+    measures.frameCount = m_iFrameCount;
+    measures.frameScale = m_fFrameScale;
+    WriteBones(measures);
+    m_kFeet.Write(measures, m_fSecondsPerFrame);
+    m_kTravel.Write(measures);
+    return measures;
+}
+
+bool HasFrames(const MotionClip& clip)
+{
+    return clip.root && clip.frameCount > 0;
+}
+
+} // namespace
+
+MotionClip ClipOf(const CMotionFile& file)
+{
+    return {file.motionRoot.Get(), file.GetFrequency(), file.GetKeyCount()};
+}
+
+ConversionMeasures MeasureConversion(const MotionClip& source, const MotionClip& result,
+                                     std::span<const BonePair> pairs)
+{
+    if (!HasFrames(source) || !HasFrames(result))
+        return {};
+    source.root->UpdateTransform(0.0f);
+    result.root->UpdateTransform(0.0f);
+    CComparison comparison(source, result, pairs);
+    comparison.Run();
+    return comparison.Measures();
+}
+
+} // namespace gw

@@ -1,0 +1,191 @@
+// Directions, jitter and travel of made clips, all within 1 % of what was put in.
+
+#include "Angles.h"
+#include "CMadeFigure.h"
+#include "FrameScale.h"
+
+#include <algorithm>
+#include <cmath>
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+constexpr double kOnePercent = 0.01;
+
+const auto kStill = [](CMadeFigure&, int) {};
+
+const BoneMeasures& BoneOf(const ConversionMeasures& measures, const std::string& target)
+{
+    static const BoneMeasures kNone;
+    const auto found = std::ranges::find(measures.bones, target, &BoneMeasures::target);
+    return found == measures.bones.end() ? kNone : *found;
+}
+
+} // namespace
+
+TEST(MeasureConversion, TurnedBoneIsOffByItsAngle)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    const MotionClip sourceClip = source.Record(40, kStill);
+    const MotionClip resultClip = result.Record(40, [](CMadeFigure& figure, int frame) {
+        const double degrees = frame < 30 ? 7.0 : 13.0;
+        figure.Turn("LForearm", kVec3UnitZ, degrees);
+    });
+    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+
+    const BoneMeasures& forearm = BoneOf(measures, "LForearm");
+    EXPECT_NEAR(forearm.meanError, 8.5, 8.5 * kOnePercent);
+    EXPECT_NEAR(forearm.largestError, 13.0, 13.0 * kOnePercent);
+    EXPECT_EQ(forearm.largestFrame, 30);
+    EXPECT_NEAR(BoneOf(measures, "LUpperArm").largestError, 0.0, 1e-3);
+    EXPECT_NEAR(measures.largestError, 13.0, 13.0 * kOnePercent);
+    const auto measured = std::ranges::count_if(measures.bones, &BoneMeasures::measured);
+    EXPECT_NEAR(measures.meanError, 8.5 / static_cast<double>(measured), 1e-3);
+}
+
+TEST(MeasureConversion, DirectionLeadsToTheNextJointThatIsAway)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    result.AddBone("Waist", "LowerTorso", {0.0f, 100.0f, 0.0f}); // unmapped: a branch that leads nowhere
+    source.AddBone("Helper", "LForearm", kVec3Zero);
+    source.AddBone("Twist", "Helper", {0.0f, 0.0f, 0.0f});
+    source.AddBone("Wrist", "Twist", {250.0f, 0.0f, 0.0f});
+    source.Remove("LHand");
+    std::vector<BonePair> pairs = PairByName(source, result);
+    pairs.push_back({&result.Bone("LHand"), &source.Bone("Wrist")});
+    const MotionClip clip = source.Record(3, kStill);
+    const ConversionMeasures measures = MeasureConversion(clip, result.Record(3, kStill), pairs);
+
+    const struct
+    {
+        const char* what;
+        const char* target;
+        const char* targetChild;
+        const char* sourceChild;
+    } rows[] = {
+        {"a hip leads along its spine",     "LowerTorso", "UpperTorso", "UpperTorso"},
+        {"a chest leads to its neck",       "UpperTorso", "Neck",       "Neck"      },
+        {"helpers at one place are passed", "LForearm",   "LHand",      "Wrist"     },
+        {"a foot leads to its toe",         "LFoot",      "LToe",       "LToe"      },
+        {"an end joint leads nowhere",      "Head",       "",           ""          },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const BoneMeasures& bone = BoneOf(measures, row.target);
+        EXPECT_EQ(bone.targetChild, row.targetChild);
+        EXPECT_EQ(bone.sourceChild, row.sourceChild);
+        EXPECT_EQ(bone.measured, *row.targetChild != '\0');
+    }
+}
+
+TEST(MeasureConversion, JitterIsTheSecondDifferenceOfDirections)
+{
+    const auto shaking = [](double degrees) {
+        return [degrees](CMadeFigure& figure, int frame) {
+            figure.Turn("LForearm", kVec3UnitZ, 0.5 * frame + (frame % 2 == 0 ? degrees : -degrees));
+        };
+    };
+    CMadeFigure source;
+    CMadeFigure result;
+    const MotionClip sourceClip = source.Record(60, shaking(0.4));
+    const MotionClip resultClip = result.Record(60, shaking(1.2));
+    const std::vector<BonePair> pairs = PairByName(source, result);
+    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, pairs);
+
+    // Two neighbours lie twice the angle off a frame, on the same side: 2 (2 sin angle).
+    const double expected = 4.0 * std::sin(1.2 * kDegreesToRadians64);
+    EXPECT_NEAR(BoneOf(measures, "LForearm").resultJitter, expected, expected * kOnePercent);
+    ASSERT_TRUE(measures.jitterRatio.has_value());
+    EXPECT_NEAR(*measures.jitterRatio, 3.0, 3.0 * kOnePercent);
+
+    CMadeFigure still;
+    EXPECT_FALSE(
+        MeasureConversion(still.Record(60, kStill), resultClip, PairByName(still, result)).jitterRatio);
+}
+
+// A source of half the size in metres that walks 2.4 m, and a result that walks so much too far.
+TEST(MeasureConversion, TravelIsComparedInLegLengths)
+{
+    const auto walking = [](double factor) {
+        return [factor](CMadeFigure& figure, int frame) {
+            const auto z = static_cast<float>(factor * 20.0 * frame);
+            figure.Move("LowerTorso", {0.3f * z, frame % 2 == 0 ? 0.0f : 30.0f, z});
+        };
+    };
+    CMadeFigure source(0.0005);
+    CMadeFigure result;
+    const MotionClip sourceClip = source.Record(121, walking(1.0));
+    const MotionClip resultClip = result.Record(121, walking(1.15));
+    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+
+    EXPECT_NEAR(measures.sourceLeg, 0.4, 0.4 * kOnePercent);
+    EXPECT_NEAR(measures.resultLeg, 800.0, 800.0 * kOnePercent);
+    EXPECT_NEAR(measures.sourceTravel, 3.0 * std::hypot(1.0, 0.3), 3.0 * kOnePercent);
+    ASSERT_TRUE(measures.travelRatio.has_value());
+    EXPECT_NEAR(*measures.travelRatio, 1.15, 1.15 * kOnePercent);
+}
+
+// What is in the source at frame f is in the result at f x scale, whatever the count was cut to.
+TEST(MeasureConversion, ResultOfAnotherRateIsSampledAtTheSourcesInstants)
+{
+    const struct
+    {
+        const char* what;
+        int sourceFrames;
+        int resultFrames;
+        double scale;
+        int compared;
+    } rows[] = {
+        {"interactive save at 30",        101, 404, 4.0,         101},
+        {"at 25: 484.8 frames are cut",   101, 484, 4.8,         101},
+        {"at 120",                        101, 101, 1.0,         101},
+        {"at 240: half of an odd number", 101, 50,  0.5,         99 },
+        {"at 7",                          33,  565, 120.0 / 7.0, 33 },
+        {"a scale of no whole rate",      101, 333, 333.0 / 101, 101},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        EXPECT_DOUBLE_EQ(FrameScaleOf(row.sourceFrames, row.resultFrames), row.scale);
+        const auto swinging = [](double scale) {
+            return
+                [scale](CMadeFigure& figure, int f) { figure.Turn("LForearm", kVec3UnitZ, 1.5 * f / scale); };
+        };
+        CMadeFigure source;
+        CMadeFigure result;
+        const MotionClip sourceClip = source.Record(row.sourceFrames, swinging(1.0), 1.0f / 60.0f);
+        const MotionClip resultClip = result.Record(row.resultFrames, swinging(row.scale), 1.0f / 60.0f);
+        const ConversionMeasures measures =
+            MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+        EXPECT_EQ(measures.frameCount, row.compared);
+        EXPECT_LT(BoneOf(measures, "LForearm").meanError, 0.01);
+    }
+}
+
+TEST(MeasureConversion, WhatCannotBeMeasuredHasNoFigures)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    const std::vector<BonePair> pairs = PairByName(source, result);
+    const MotionClip clip = source.Record(1, kStill);
+    const MotionClip still = result.Record(1, kStill);
+    EXPECT_EQ(MeasureConversion({}, still, pairs).frameCount, 0);
+    EXPECT_EQ(MeasureConversion(clip, {still.root, still.frequency, 0}, pairs).frameCount, 0);
+
+    const ConversionMeasures unmapped = MeasureConversion(clip, still, {});
+    EXPECT_EQ(unmapped.frameCount, 1);
+    EXPECT_TRUE(unmapped.bones.empty() && unmapped.feet.empty());
+    EXPECT_FALSE(unmapped.contactF1 || unmapped.travelRatio || unmapped.jitterRatio || unmapped.floorHeight);
+
+    const ConversionMeasures oneFrame = MeasureConversion(clip, still, pairs);
+    EXPECT_EQ(oneFrame.feet.size(), 2u);
+    EXPECT_NEAR(oneFrame.largestError, 0.0, 1e-3);
+    EXPECT_FALSE(oneFrame.jitterRatio || oneFrame.travelRatio);
+}
+
+} // namespace gw

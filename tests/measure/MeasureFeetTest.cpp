@@ -1,0 +1,219 @@
+// Contacts, slide, sink, turn, tilt and knees of made clips, all within 1 % of what was put in.
+
+#include "Angles.h"
+#include "CMadeFigure.h"
+
+#include <algorithm>
+#include <cmath>
+#include <gtest/gtest.h>
+#include <random>
+
+namespace gw {
+
+namespace {
+
+constexpr double kOnePercent = 0.01;
+constexpr int kFrames = 120;
+constexpr int kPeriod = 40; // frames of a step: the foot stands for 24 and swings for 16
+constexpr int kStand = 24;
+
+/// How a foot walks on the spot, and what is wrong with it. Lengths in mm, angles in degrees.
+struct Step
+{
+    double drift = 0.0; ///< over each stand, forwards
+    double sink = 0.0;
+    double turn = 0.0;
+    double tilt = 0.0; ///< while it stands
+    int early = 0;     ///< frames that it leaves the floor too soon
+    double noise = 0.0;
+};
+
+Vec3 FootAt(const Step& step, int frame)
+{
+    const int phase = frame % kPeriod;
+    const int stand = kStand - step.early;
+    const auto down = static_cast<float>(-step.sink);
+    if (phase < stand)
+        return {0.0f, down, static_cast<float>(step.drift * phase / (stand - 1))};
+    const double swing = (phase - stand + 1.0) / (kPeriod - stand + 1.0);
+    return {0.0f, down + static_cast<float>(150.0 * std::sin(swing * kPi64)),
+            static_cast<float>(step.drift + 600.0 * std::sin(swing * kPi64))};
+}
+
+auto Walking(const Step& step)
+{
+    return [step, random = std::mt19937(7)](CMadeFigure& figure, int frame) mutable {
+        std::normal_distribution<float> noise(0.0f, static_cast<float>(std::max(step.noise, 1e-9)));
+        for (const char* foot : {"LFoot", "RFoot"})
+        {
+            figure.Move(foot, FootAt(step, frame) + Vec3{noise(random), noise(random), noise(random)});
+            figure.Turn(foot, kVec3UnitX, frame % kPeriod < kStand ? step.tilt : 20.0);
+            figure.Turn(foot, kVec3UnitY, step.turn);
+        }
+    };
+}
+
+ConversionMeasures MeasureWalks(const Step& sourceStep, const Step& resultStep, double sourceUnit = 1.0)
+{
+    CMadeFigure source(sourceUnit);
+    CMadeFigure result;
+    const MotionClip sourceClip = source.Record(kFrames, Walking(sourceStep));
+    const MotionClip resultClip = result.Record(kFrames, Walking(resultStep));
+    return MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+}
+
+} // namespace
+
+TEST(MeasureFeet, ContactsAreTheFramesThatStand)
+{
+    const ConversionMeasures same = MeasureWalks({}, {});
+    ASSERT_EQ(same.feet.size(), 2u);
+    EXPECT_EQ(same.feet[0].target, "LFoot");
+    EXPECT_EQ(same.feet[0].sourceContacts, 3u);
+    EXPECT_EQ(same.feet[0].sourceStanding, 3u * kStand);
+    EXPECT_DOUBLE_EQ(same.contactF1.value_or(0.0), 1.0);
+
+    const ConversionMeasures early = MeasureWalks({}, {.early = 8});
+    const double standing = kStand;
+    const double expected = 2.0 * (standing - 8.0) / (standing + standing - 8.0);
+    EXPECT_NEAR(early.contactF1.value_or(0.0), expected, expected * kOnePercent);
+    EXPECT_EQ(early.feet[0].bothStanding, 3u * (kStand - 8));
+}
+
+TEST(MeasureFeet, NoiseMakesNoContacts)
+{
+    const ConversionMeasures noisy = MeasureWalks({.noise = 2.0}, {.noise = 2.0});
+    for (const FootMeasures& foot : noisy.feet)
+    {
+        EXPECT_EQ(foot.sourceContacts, 3u);
+        EXPECT_EQ(foot.resultContacts, 3u);
+        EXPECT_GT(foot.contactF1.value_or(0.0), 0.97);
+    }
+}
+
+TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
+{
+    const struct
+    {
+        const char* what;
+        double sourceDrift; // mm of a figure of the result's size
+        double resultDrift;
+        double unit; // of the source
+    } rows[] = {
+        {"the result slides",           0.0,  25.0, 1.0   },
+        {"a source in metres",          0.0,  25.0, 0.001 },
+        {"a source of half the size",   0.0,  25.0, 0.0005},
+        {"both slide, the result more", 10.0, 35.0, 0.1   },
+        {"the result slides less",      30.0, 5.0,  0.001 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const ConversionMeasures walks =
+            MeasureWalks({.drift = row.sourceDrift}, {.drift = row.resultDrift}, row.unit);
+        const double added = row.resultDrift - row.sourceDrift;
+        for (const FootMeasures& foot : walks.feet)
+        {
+            EXPECT_NEAR(foot.addedSlideMean, added, std::fabs(added) * kOnePercent);
+            EXPECT_NEAR(foot.addedSlideLargest, added, std::fabs(added) * kOnePercent);
+            EXPECT_NEAR(foot.addedSlideMeanShare, added / 800.0, std::fabs(added) / 800.0 * kOnePercent);
+            EXPECT_NEAR(foot.sourceSlideShare, row.sourceDrift / 800.0,
+                        row.sourceDrift / 800.0 * kOnePercent + 1e-6);
+        }
+    }
+}
+
+TEST(MeasureFeet, SoleStandsAndSinksByItsDepth)
+{
+    const ConversionMeasures sunk = MeasureWalks({}, {.sink = 12.0});
+    EXPECT_NEAR(sunk.sinkDepth, 12.0, 12.0 * kOnePercent);
+    EXPECT_NEAR(sunk.floorHeight.value_or(0.0), -12.0, 12.0 * kOnePercent);
+    EXPECT_DOUBLE_EQ(sunk.contactF1.value_or(0.0), 1.0) << "the floor of a clip is its own";
+
+    const ConversionMeasures floating = MeasureWalks({}, {.sink = -9.0});
+    EXPECT_NEAR(floating.floorHeight.value_or(0.0), 9.0, 9.0 * kOnePercent);
+    EXPECT_EQ(floating.sinkDepth, 0.0);
+
+    // A toe that dips: 150 mm in front of the ankle, 100 mm of it under the joint.
+    const ConversionMeasures tilted = MeasureWalks({}, {.tilt = 5.0});
+    const double angle = 5.0 * kDegreesToRadians64;
+    const double dip = 150.0 * std::sin(angle) - 100.0 * (1.0 - std::cos(angle));
+    EXPECT_NEAR(tilted.sinkDepth, dip, dip * kOnePercent);
+    EXPECT_NEAR(tilted.feet[0].soleTiltMean, 5.0, 5.0 * kOnePercent);
+    EXPECT_NEAR(tilted.feet[0].soleTiltLargest, 5.0, 5.0 * kOnePercent);
+    EXPECT_NEAR(tilted.feet[0].sourceSoleTiltMean, 0.0, 0.05);
+}
+
+TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
+{
+    const struct
+    {
+        const char* what;
+        double sourceTurn;
+        double resultTurn;
+        double expected;
+    } rows[] = {
+        {"out",                       0.0,   11.0,   11.0 },
+        {"in",                        0.0,   -11.0,  -11.0},
+        {"both",                      30.0,  41.0,   11.0 },
+        {"over the back of a circle", 175.0, -174.0, 11.0 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const ConversionMeasures walks =
+            MeasureWalks({.turn = row.sourceTurn}, {.turn = row.resultTurn}, 0.01);
+        for (const FootMeasures& foot : walks.feet)
+        {
+            EXPECT_NEAR(foot.turnMean, row.expected, 11.0 * kOnePercent);
+            EXPECT_NEAR(foot.turnError, 11.0, 11.0 * kOnePercent);
+            EXPECT_NEAR(foot.turnLargest, 11.0, 11.0 * kOnePercent);
+            EXPECT_NEAR(foot.turnWhileStanding, 11.0, 11.0 * kOnePercent);
+            EXPECT_FALSE(foot.turnFromStart);
+        }
+    }
+}
+
+// Without a toe joint nobody knows where a foot points; how far it turns is known.
+TEST(MeasureFeet, FootWithoutToeTurnsFromItsStart)
+{
+    CMadeFigure source;
+    source.Remove("LToe");
+    CMadeFigure result;
+    const auto turning = [](double startTurn, double endTurn) {
+        return [=](CMadeFigure& figure, int frame) {
+            figure.Turn("LFoot", kVec3UnitY, frame < 1 ? startTurn : endTurn);
+        };
+    };
+    const MotionClip sourceClip = source.Record(200, turning(70.0, 90.0));
+    const MotionClip resultClip = result.Record(200, turning(0.0, 31.0));
+    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+    ASSERT_EQ(measures.feet.size(), 2u);
+    EXPECT_TRUE(measures.feet[0].turnFromStart);
+    EXPECT_NEAR(measures.feet[0].turnMean, 11.0, 11.0 * kOnePercent);
+    EXPECT_FALSE(measures.feet[1].turnFromStart);
+}
+
+TEST(MeasureFeet, KneePopIsAChangeThatTheSourceHasNot)
+{
+    const auto kneeling = [](double pop) {
+        return [pop](CMadeFigure& figure, int frame) {
+            figure.Turn("LCalf", kVec3UnitX, 30.0 + 4.0 * (frame % 5) + (frame == 50 ? pop : 0.0));
+        };
+    };
+    CMadeFigure source;
+    CMadeFigure result;
+    const MotionClip sourceClip = source.Record(100, kneeling(0.0));
+    const MotionClip resultClip = result.Record(100, kneeling(25.0));
+    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+    ASSERT_EQ(measures.feet.size(), 2u);
+    const FootMeasures& left = measures.feet[0];
+    // From 46 to 55 where the source goes from 46 to 30, and from 55 to 34 where it goes from 30 to 34.
+    EXPECT_EQ(left.kneePops, 1u);
+    EXPECT_NEAR(left.kneePopLargest, 17.0, 17.0 * kOnePercent);
+    EXPECT_NEAR(left.kneeChangeLargest, 21.0, 21.0 * kOnePercent);
+    EXPECT_NEAR(left.sourceKneeChangeLargest, 16.0, 16.0 * kOnePercent);
+    EXPECT_EQ(measures.feet[1].kneePops, 0u);
+}
+
+} // namespace gw
