@@ -1,0 +1,208 @@
+#include "CFieldDescriber.h"
+
+#include "CJsonWriter.h"
+
+#include <algorithm>
+#include <cstring>
+
+namespace gw {
+
+namespace {
+
+// How one value of a kind becomes JSON.
+struct KindRow
+{
+    size_t floats; // how many floats it is made of, or 0
+    int64_t (*integer)(const void* value);
+};
+
+template <class T>
+int64_t IntegerAt(const void* value)
+{
+    T number;
+    std::memcpy(&number, value, sizeof number);
+    return number;
+}
+
+constexpr KindRow kKinds[] = {
+    {0,  IntegerAt<uint8_t> }, // Bool
+    {0,  IntegerAt<uint8_t> }, // Byte
+    {0,  IntegerAt<uint16_t>}, // Word
+    {0,  IntegerAt<uint32_t>}, // Unsigned
+    {0,  IntegerAt<int32_t> }, // Signed
+    {1,  nullptr            }, // Float
+    {3,  nullptr            }, // Vector
+    {4,  nullptr            }, // Quaternion
+    {16, nullptr            }, // Matrix
+};
+
+void WriteValue(CJsonWriter& json, EFieldKind kind, const std::byte* value)
+{
+    const KindRow& row = kKinds[static_cast<size_t>(kind)];
+    if (kind == EFieldKind::Bool)
+        return json.Bool(row.integer(value) != 0);
+    if (row.integer)
+        return json.Integer(row.integer(value));
+    float floats[16];
+    std::memcpy(floats, value, row.floats * sizeof(float));
+    if (row.floats == 1)
+        return json.Number(floats[0]);
+    json.Numbers({floats, row.floats});
+}
+
+std::string Hex(const std::byte* bytes, size_t count)
+{
+    constexpr char kDigits[] = "0123456789abcdef";
+    std::string text;
+    for (size_t i = 0; i < count; ++i)
+    {
+        text += kDigits[std::to_integer<unsigned>(bytes[i]) >> 4];
+        text += kDigits[std::to_integer<unsigned>(bytes[i]) & 15];
+    }
+    return text;
+}
+
+// Embedded files and pictures tell nobody anything byte by byte: of a long block the beginning is shown.
+void WriteBytes(CJsonWriter& json, const std::byte* bytes, size_t count)
+{
+    constexpr size_t kShownBytes = 64;
+    if (count <= kShownBytes)
+        return json.Text(Hex(bytes, count));
+    json.BeginObject();
+    json.Key("bytes").Integer(static_cast<int64_t>(count));
+    json.Key("first").Text(Hex(bytes, kShownBytes));
+    json.EndObject();
+}
+
+} // namespace
+
+CFieldDescriber::PendingCount CFieldDescriber::TakeCount(std::string_view nextName)
+{
+    const PendingCount pending = std::exchange(m_kCount, {});
+    if (pending.name == nextName)
+        return pending;
+    if (!pending.name.empty() && IsTold(EDescribe::Fields))
+    {
+        Key(pending.name);
+        m_kJson.Integer(static_cast<int64_t>(pending.count));
+    }
+    return {};
+}
+
+void CFieldDescriber::Key(std::string_view name)
+{
+    if (!m_kNest.empty())
+    {
+        if (!m_kNest.back())
+            m_kJson.Key(name);
+        return;
+    }
+    const int earlier = m_kSeen[std::string(name)]++;
+    m_kJson.Key(earlier == 0 ? std::string(name) : std::string(name) + '[' + std::to_string(earlier) + ']');
+}
+
+void CFieldDescriber::Text(const char* name, CText& text)
+{
+    TakeCount(name);
+    if (!IsTold(EDescribe::Fields))
+        return;
+    Key(name);
+    if (text.IsNull())
+        m_kJson.Null();
+    else
+        m_kJson.Text(text.View());
+}
+
+bool CFieldDescriber::Presence(const char* name, bool present)
+{
+    TakeCount({});
+    if (present)
+    {
+        m_kCount = {name, 1, 0};
+    }
+    else if (IsTold(EDescribe::Fields))
+    {
+        Key(name);
+        m_kJson.Null();
+    }
+    return present;
+}
+
+size_t CFieldDescriber::Count(const char* name, size_t count, size_t leastBytes)
+{
+    TakeCount({});
+    m_kCount = {name, count, leastBytes};
+    return count;
+}
+
+void CFieldDescriber::Values(const char* name, EFieldKind kind, void* values, size_t count)
+{
+    const bool isBlock = !TakeCount(name).name.empty() || count != 1;
+    if (!IsTold(EDescribe::Fields))
+        return;
+    Key(name);
+    const std::byte* value = static_cast<const std::byte*>(values);
+    if (!isBlock)
+        return WriteValue(m_kJson, kind, value);
+    if (kind == EFieldKind::Byte)
+        return WriteBytes(m_kJson, value, count);
+    m_kJson.BeginArray();
+    for (size_t i = 0; i < count; ++i)
+        WriteValue(m_kJson, kind, value + i * FieldBytes(kind));
+    m_kJson.EndArray();
+}
+
+void CFieldDescriber::Slot(const char* name, const CLinkSlot& slot)
+{
+    TakeCount(name);
+    if (!IsTold(EDescribe::Links))
+        return;
+    Key(name);
+    const auto number = m_kNumbers.find(slot.Get());
+    if (number == m_kNumbers.end())
+        m_kJson.Null();
+    else
+        m_kJson.Integer(static_cast<int64_t>(number->second));
+}
+
+// A list of records has a count before it, of records that are larger than a link. What has no count, or one
+// of link size, is a row of links.
+void CFieldDescriber::BeginArray(const char* name, size_t)
+{
+    constexpr size_t kLinkBytes = 4;
+    const PendingCount count = TakeCount(name);
+    const bool isLinks = count.name.empty() || count.leastBytes == kLinkBytes;
+    if (m_kNest.empty())
+        m_bArrayIsTold = m_eWhat == (isLinks ? EDescribe::Links : EDescribe::Fields);
+    if (m_bArrayIsTold)
+    {
+        Key(name);
+        m_kJson.BeginArray();
+    }
+    m_kNest.push_back(true);
+}
+
+void CFieldDescriber::EndArray()
+{
+    TakeCount({});
+    m_kNest.pop_back();
+    if (m_bArrayIsTold)
+        m_kJson.EndArray();
+}
+
+void CFieldDescriber::BeginElement()
+{
+    if (m_bArrayIsTold)
+        m_kJson.BeginObject();
+    m_kNest.push_back(false);
+}
+
+void CFieldDescriber::EndElement()
+{
+    TakeCount({});
+    m_kNest.pop_back();
+    if (m_bArrayIsTold)
+        m_kJson.EndObject();
+}
+
+} // namespace gw

@@ -1,0 +1,76 @@
+#pragma once
+
+#include "CFieldArchive.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <map>
+#include <string>
+#include <string_view>
+#include <unordered_map>
+#include <vector>
+
+namespace gw {
+
+class CJsonWriter;
+
+/// The numbers by which a report names the objects of a scene.
+using CObjectNumbers = std::unordered_map<const CObject*, size_t>;
+
+/// What is told of an object's fields.
+enum class EDescribe : uint8_t
+{
+    Links,  ///< references to other objects, as their numbers; null for none and for what the scene does not
+            ///< hold
+    Fields, ///< everything else
+};
+
+/// Writes an object's fields as members of a JSON object, by name and in file order: vectors, quaternions
+/// (w x y z) and matrices as arrays of numbers, a block of bytes as hex. Links inside a list of records stay
+/// with their record.
+class CFieldDescriber : public CFieldArchive
+{
+public:
+    CFieldDescriber(EDescribe what, CJsonWriter& json, const CObjectNumbers& numbers)
+        : CFieldArchive(false, kNewestVersion), m_eWhat(what), m_kJson(json), m_kNumbers(numbers)
+    {
+    }
+    ~CFieldDescriber() override { TakeCount({}); }
+
+    void Text(const char* name, CText& text) override;
+    bool Presence(const char* name, bool present) override;
+    size_t Count(const char* name, size_t count, size_t leastBytes) override;
+
+protected:
+    void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Slot(const char* name, const CLinkSlot& slot) override;
+    void BeginArray(const char* name, size_t count) override;
+    void EndArray() override;
+    void BeginElement() override;
+    void EndElement() override;
+
+private:
+    // A count that belongs to the field behind it where that has the same name, and is a field itself
+    // otherwise.
+    struct PendingCount
+    {
+        std::string_view name; ///< empty for none
+        size_t count = 0;
+        size_t leastBytes = 0;
+    };
+
+    bool IsTold(EDescribe what) const { return m_kNest.empty() ? what == m_eWhat : m_bArrayIsTold; }
+    PendingCount TakeCount(std::string_view nextName);
+    void Key(std::string_view name);
+
+    EDescribe m_eWhat;
+    CJsonWriter& m_kJson;
+    const CObjectNumbers& m_kNumbers;
+    PendingCount m_kCount;
+    std::vector<bool> m_kNest; ///< arrays (true) and their elements (false) around the present place
+    bool m_bArrayIsTold = false;
+    std::map<std::string, int, std::less<>>
+        m_kSeen; ///< members so far, since a list may name two fields alike
+};
+
+} // namespace gw

@@ -1,0 +1,41 @@
+#pragma once
+
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// What the program answers to the shell.
+enum class EExit : int
+{
+    Done = 0,
+    Failed = 1, ///< some work failed
+    Usage = 2,  ///< the command line was wrong, and nothing was done
+};
+
+/// What a command line asks for. One record serves all commands; each reads what its row in the table of
+/// commands lets through.
+struct COptions
+{
+    std::vector<std::string> files; ///< operands, in the order of the command line
+
+    std::string output;       ///< -o
+    std::string outputFolder; ///< --out-dir
+    std::string profile;      ///< a display name, or the path of a .prf file
+    std::string dataFolder;   ///< replaces the folder beside the executable; empty for that
+    std::string job;          ///< htr or orn
+    int64_t frame = 0;
+    float rate = 0.0f;       ///< frames per second
+    float frameScale = 1.0f; ///< factor for the number of frames
+
+    bool json = false;
+    bool quiet = false;
+    bool force = false;        ///< replace outputs that exist
+    bool skipExisting = false; ///< pass over sources whose output exists
+    bool dryRun = false;       ///< say what would be done
+    bool noLegs = false;       ///< leave the feet to the plain rotation transfer
+    bool keepGoing = false;    ///< go on behind a source that failed
+};
+
+} // namespace gw

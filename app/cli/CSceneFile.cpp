@@ -1,0 +1,103 @@
+#include "CSceneFile.h"
+
+#include "CKeyframeControl.h"
+#include "Paths.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <unordered_set>
+
+namespace gw {
+
+namespace {
+
+bool HasContainerName(const std::string& path)
+{
+    return HasExtension(path, ".orn") || HasExtension(path, ".Kinetra");
+}
+
+} // namespace
+
+bool CSceneFile::Load(const std::string& path)
+{
+    m_bContainer = HasContainerName(path);
+    if (!m_bContainer && (m_kMotion.Load(path) || Failure().reason != EFailure::UnknownFormat))
+        return !Failure();
+    const bool isContainer = m_kScene.LoadFile(path, false);
+    m_bContainer = m_bContainer || isContainer;
+    return isContainer;
+}
+
+bool CSceneFile::LoadWhole(const std::string& path)
+{
+    if (!Load(path))
+        SayFailure(path, Failure());
+    else if (IsDamaged())
+        SayDamage(path, Failure());
+    return !Failure();
+}
+
+std::vector<CObject*> CSceneFile::Roots() const
+{
+    if (!m_bContainer)
+        return {m_kMotion.motionRoot.Get()};
+    std::vector<CObject*> roots;
+    for (size_t i = 0; i < m_kScene.GetRootCount(); ++i)
+        roots.push_back(m_kScene.GetRoot(i));
+    return roots;
+}
+
+// Not by FindObjects: in a scene with shared nodes that would tell a node once per place.
+std::vector<CFoundNode> CSceneFile::Nodes() const
+{
+    std::vector<CFoundNode> found;
+    std::vector<CFoundNode> open;
+    std::unordered_set<const CNode*> seen;
+    const std::vector<CObject*> roots = Roots();
+    for (auto root = roots.rbegin(); root != roots.rend(); ++root)
+    {
+        if (CNode* node = RecordCast<CNode>(*root))
+            open.push_back({node, nullptr, 0});
+    }
+    while (!open.empty())
+    {
+        const CFoundNode next = open.back();
+        open.pop_back();
+        if (!seen.insert(next.node).second)
+            continue;
+        found.push_back(next);
+        for (size_t i = next.node->GetChildCount(); i-- > 0;)
+        {
+            if (CNode* child = RecordCast<CNode>(next.node->ChildAt(i)))
+                open.push_back({child, next.node, next.depth + 1});
+        }
+    }
+    return found;
+}
+
+// The save list has every object once, in the order in which FindObject would meet it.
+const CKeyframeControl* CSceneFile::FirstTrack()
+{
+    if (!m_bContainer)
+        return RecordCast<CKeyframeControl>(
+            m_kMotion.motionRoot->FindObject(nullptr, &CKeyframeControl::ms_kRTTI, true));
+    const std::vector<CObject*> objects = m_kScene.ObjectsInSaveOrder();
+    const auto isTrack = [](const CObject* object) {
+        return IsDerivedFrom(*object, &CKeyframeControl::ms_kRTTI);
+    };
+    const auto track = std::ranges::find_if(objects, isTrack);
+    return track == objects.end() ? nullptr : static_cast<const CKeyframeControl*>(*track);
+}
+
+void CSceneFile::Update(int64_t frame)
+{
+    const CKeyframeControl* track = FirstTrack();
+    const float time = track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
+    for (CObject* root : Roots())
+    {
+        if (CSpatial* spatial = RecordCast<CSpatial>(root))
+            spatial->UpdateScene(time, true);
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,60 @@
+#pragma once
+
+#include "COptions.h"
+
+#include <cstddef>
+#include <span>
+#include <string_view>
+
+namespace gw {
+
+/// The options that a command can take, one bit each.
+enum EOption : uint32_t
+{
+    kOutput = 1u << 0,
+    kOutputFolder = 1u << 1,
+    kProfile = 1u << 2,
+    kJob = 1u << 3,
+    kFrame = 1u << 4,
+    kRate = 1u << 5,
+    kFrameScale = 1u << 6,
+    kNoLegs = 1u << 7,
+    kForce = 1u << 8,
+    kSkipExisting = 1u << 9,
+    kDryRun = 1u << 10,
+    kKeepGoing = 1u << 11,
+    kDataFolder = 1u << 12,
+    kJson = 1u << 13,
+    kQuiet = 1u << 14,
+};
+
+/// One command of the program.
+struct CCommand
+{
+    std::string_view name;
+    std::string_view operands; ///< as the usage line shows them
+    size_t leastOperands;
+    size_t mostOperands;
+    uint32_t options;  ///< bits of EOption beside those that every command takes
+    uint32_t required; ///< which of them must be there
+    std::string_view help;
+    std::string_view example;
+    EExit (*run)(const COptions& options);
+};
+
+/// The table of commands, in the order of the help.
+std::span<const CCommand> Commands();
+
+// The commands. Each prints results on standard output and words on standard error.
+EExit RunConvert(const COptions& options);
+EExit RunBatchFolder(const COptions& options);
+EExit RunInfo(const COptions& options);
+EExit RunPose(const COptions& options);
+EExit RunTranscode(const COptions& options);
+EExit RunResave(const COptions& options);
+EExit RunExtract(const COptions& options);
+EExit RunPackage(const COptions& options);
+EExit RunProfiles(const COptions& options);
+EExit RunCompare(const COptions& options);
+
+} // namespace gw

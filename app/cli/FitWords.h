@@ -1,0 +1,25 @@
+#pragma once
+
+#include <string>
+
+namespace gw {
+
+class CJsonWriter;
+struct CProfileFit;
+
+/// Whether a profile fits a source better than another: one of which all rows fit goes before one of which
+/// not, more rows before fewer, and of those that do not fit the one that misses less.
+bool IsBetterFit(const CProfileFit& fit, const CProfileFit& other);
+
+/// "23 rows, all fit" or "20 of 23 rows fit".
+std::string FitSummary(const CProfileFit& fit);
+/// What a profile misses, one line each, with the nearest names.
+std::string MissingLines(const CProfileFit& fit);
+/// Why a source is not converted by a profile, on standard error, with both.
+void SayMisfit(const std::string& source, const CProfileFit& fit);
+/// Why it is converted by none, with the one that comes nearest; without rows none is installed.
+void SayNoneFits(const std::string& source, const CProfileFit& nearest);
+/// The same as members of a JSON object.
+void WriteFit(CJsonWriter& json, const CProfileFit& fit);
+
+} // namespace gw

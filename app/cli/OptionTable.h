@@ -1,0 +1,39 @@
+#pragma once
+
+#include "Commands.h"
+
+#include <span>
+#include <variant>
+
+namespace gw {
+
+/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, an integer.
+using COptionTarget =
+    std::variant<bool COptions::*, std::string COptions::*, float COptions::*, int64_t COptions::*>;
+
+/// One option of the program.
+struct COptionRow
+{
+    EOption bit;
+    std::string_view names; ///< "-o,--output"
+    std::string_view value; ///< what stands behind it, as the help shows it; empty for a switch
+    std::string_view help;
+    COptionTarget target;
+    std::string_view choices =
+        {}; ///< the words that may stand behind it, with "|" between them; empty for any
+};
+
+/// The table of options, in the order of the help.
+std::span<const COptionRow> OptionTable();
+
+/// The bits of all options that a command takes.
+uint32_t OptionsOf(const CCommand& command);
+
+/// The help of the program: every command with a line.
+std::string ProgramHelp();
+/// The help of a command: usage, what it does, options, an example.
+std::string CommandHelp(const CCommand& command);
+/// "gaitwright pose FILE --frame N [OPTIONS]".
+std::string UsageLine(const CCommand& command);
+
+} // namespace gw

@@ -1,0 +1,46 @@
+#include "Output.h"
+
+#include "CJsonWriter.h"
+#include "Paths.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <cstdio>
+
+namespace gw {
+
+bool IsTaken(const std::string& path)
+{
+    return FileExists(path) || FolderExists(path);
+}
+
+bool MayWrite(const COptions& options, const std::string& path)
+{
+    if (FolderExists(path))
+        SayError(Printable(path) + ": this is a folder; name the file to write");
+    else if (FileExists(path) && !options.force)
+        SayError(Printable(path) + ": the file exists; --force replaces it");
+    else
+        return true;
+    return false;
+}
+
+EExit TellWritten(const COptions& options, const std::string& source, const std::string& output)
+{
+    if (options.json)
+    {
+        CJsonWriter json(stdout);
+        json.BeginObject();
+        json.Key("source").Text(source);
+        json.Key("output").Text(output);
+        json.EndObject();
+        json.EndDocument();
+    }
+    else if (!options.quiet)
+    {
+        std::printf("%s -> %s\n", Printable(source).c_str(), Printable(output).c_str());
+    }
+    return EExit::Done;
+}
+
+} // namespace gw

@@ -1,0 +1,53 @@
+#include "PackageBlocks.h"
+
+#include "CCustomData.h"
+#include "COrrinStream.h"
+
+#include <cstring>
+#include <span>
+
+namespace gw {
+
+namespace {
+
+static_assert(sizeof(CPackageFacts) == 16); // as it lies in the file
+
+// A chain is as long as the objects in the file, and a ring is refused when it is read.
+CRawData* FindInChain(CCustomData* data, const char* name)
+{
+    for (; data; data = data->GetNextData())
+    {
+        if (data->NameView() == name && RecordCast<CRawData>(data))
+            return static_cast<CRawData*>(data);
+    }
+    return nullptr;
+}
+
+} // namespace
+
+CPackageBlocks FindPackage(const COrrinStream& scene)
+{
+    CPackageBlocks blocks;
+    for (size_t i = 0; i < scene.GetRootCount() && !blocks.info; ++i)
+        blocks.info = FindInChain(RecordCast<CRawData>(scene.GetRoot(i)), "MotionInfo");
+    if (blocks.info)
+        blocks.file = FindInChain(blocks.info->GetNextData(), "MotionFile");
+    return blocks;
+}
+
+bool ReadPackageFacts(const CRawData& info, CPackageFacts& facts)
+{
+    const std::span<const std::byte> bytes = info.Data();
+    if (bytes.size() != sizeof facts)
+        return false;
+    std::memcpy(&facts, bytes.data(), sizeof facts);
+    return true;
+}
+
+const char* FormatExtension(uint32_t format)
+{
+    constexpr const char* kExtensions[] = {"", ".cha", ".chb", ".htr"};
+    return format < std::size(kExtensions) ? kExtensions[format] : "";
+}
+
+} // namespace gw

@@ -1,0 +1,15 @@
+#pragma once
+
+#include <string>
+
+namespace gw {
+
+class CMotionFile;
+class COrrinStream;
+
+/// Reads a container that must be whole. Says what is wrong with any other.
+bool LoadWhole(COrrinStream& scene, const std::string& path);
+/// Reads the motion inside a Kinetra file. Says why it cannot.
+bool LoadPackagedMotion(const std::string& path, CMotionFile& motion);
+
+} // namespace gw

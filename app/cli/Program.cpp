@@ -1,0 +1,48 @@
+#include "Program.h"
+
+#include "Arguments.h"
+#include "Commands.h"
+#include "Words.h"
+
+#include <csignal>
+#include <cstdio>
+#include <new>
+
+namespace gw {
+
+namespace {
+
+// Readers and writers bound what they take by the size of the file, so that only a machine that has less gets
+// here.
+EExit RunCommand(const CArguments& arguments)
+{
+    try
+    {
+        return arguments.command->run(arguments.options);
+    } catch (const std::bad_alloc&)
+    {
+        SayError("there is not enough memory for this");
+        return EExit::Failed;
+    }
+}
+
+} // namespace
+
+int RunProgram(int argc, char** argv)
+{
+#ifdef SIGXFSZ
+    // A file size limit answers the write with an error, as a full disk does; by itself it would end the
+    // program and leave half a file.
+    std::signal(SIGXFSZ, SIG_IGN);
+#endif
+    const CArguments arguments = ParseArguments(argc, argv);
+    EExit exit = arguments.command ? RunCommand(arguments) : arguments.exit;
+    if (std::fflush(stdout) != 0 || std::ferror(stdout))
+    {
+        SayError("standard output cannot be written");
+        exit = EExit::Failed;
+    }
+    return static_cast<int>(exit);
+}
+
+} // namespace gw

@@ -1,0 +1,63 @@
+#include "CMotionFile.h"
+#include "Commands.h"
+#include "Output.h"
+#include "Paths.h"
+#include "TKBVHStream.h"
+#include "Text.h"
+#include "Words.h"
+
+namespace gw {
+
+namespace {
+
+EExit Fail(const std::string& path, const CFailure& failure)
+{
+    SayFailure(path, failure);
+    return EExit::Failed;
+}
+
+bool CanTranscode(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    if (HasExtension(output, ".bvh"))
+    {
+        if (options.frameScale == 1.0f)
+            return true;
+        SayError("--frame-scale is for .htr files; a .bvh is written frame by frame");
+        return false;
+    }
+    if (HasExtension(output, ".htr") && HasExtension(source, ".htr"))
+        return true;
+    SayError(Printable(output) + ": an .htr can be written as .htr or .bvh, any other motion as .bvh; "
+                                 "'gaitwright convert' makes an .htr of it");
+    return false;
+}
+
+} // namespace
+
+EExit RunTranscode(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    if (!CanTranscode(options))
+        return EExit::Usage;
+    if (!MayWrite(options, output))
+        return EExit::Failed;
+    CMotionFile motion;
+    if (!motion.Load(source))
+        return Fail(source, motion.Record().Failure());
+    SayWarnings(options, source, motion.Record());
+    if (HasExtension(output, ".htr"))
+    {
+        if (!motion.Save(output, options.frameScale))
+            return Fail(output, motion.Record().Failure());
+        return TellWritten(options, source, output);
+    }
+    TKBVHStream stream(motion);
+    if (!stream.WriteFile(output))
+        return Fail(output, stream.Record().Failure());
+    return TellWritten(options, source, output);
+}
+
+} // namespace gw

@@ -1,0 +1,56 @@
+#include "Words.h"
+
+#include "CFailure.h"
+#include "COptions.h"
+#include "CReport.h"
+#include "FailureWords.h"
+#include "Text.h"
+
+#include <cstdio>
+
+namespace gw {
+
+void SayError(std::string_view words)
+{
+    // One call a line, so that lines of several programs on one terminal do not mix.
+    const std::string line = "gaitwright: " + std::string(words) + '\n';
+    std::fwrite(line.data(), 1, line.size(), stderr);
+}
+
+void SayWord(const COptions& options, std::string_view words)
+{
+    if (!options.quiet)
+        SayError(words);
+}
+
+void SayReport(const COptions& options, const CReport& report)
+{
+    if (report.warning)
+        SayWord(options, "warning: " + ReportLine(report));
+    else
+        SayError(ReportLine(report));
+}
+
+void SayFailure(const std::string& path, const CFailure& failure)
+{
+    SayError(ReportLine(MakeReport(path, failure, false)));
+}
+
+void SayWarnings(const COptions& options, const std::string& path, const CFailureRecord& record)
+{
+    for (const CFailure& warning : record.Warnings())
+        SayReport(options, MakeReport(path, warning, true));
+}
+
+void SayDamage(const std::string& path, const CFailure& failure)
+{
+    const std::string place = failure.where == 0 ? "" : " at byte " + std::to_string(failure.where);
+    SayError(Printable(path) + ": damaged" + place + ": " + MakeReport(path, failure, false).words);
+}
+
+std::string Quoted(std::string_view name)
+{
+    return '"' + Printable(name) + '"';
+}
+
+} // namespace gw

@@ -1,0 +1,30 @@
+#pragma once
+
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+class CFailureRecord;
+struct CFailure;
+struct COptions;
+struct CReport;
+
+/// A line on standard error under the program's name. Names from files must be printable already.
+void SayError(std::string_view words);
+/// The same for what is good to know and no failure; silent with --quiet.
+void SayWord(const COptions& options, std::string_view words);
+/// A failure always, a warning unless --quiet.
+void SayReport(const COptions& options, const CReport& report);
+/// The failure that a file's reader or writer kept, in words.
+void SayFailure(const std::string& path, const CFailure& failure);
+/// All warnings that it kept.
+void SayWarnings(const COptions& options, const std::string& path, const CFailureRecord& record);
+
+/// What stopped the reading of a container: "scene.orn: damaged at byte 381: ...".
+void SayDamage(const std::string& path, const CFailure& failure);
+
+/// A name from a file in quotes, safe to print.
+std::string Quoted(std::string_view name);
+
+} // namespace gw
