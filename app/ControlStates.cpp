@@ -79,6 +79,12 @@ uint32_t When(bool holds, uint32_t fact)
     return holds ? fact : 0;
 }
 
+// A motion without keys may name a last frame below 0.
+bool HasSeveralFrames(const CMotionFile& motion)
+{
+    return motion.GetKeyCount() > 0 && motion.GetLastFrame() != 0.0f;
+}
+
 int ScrollValue(const Clock& clock)
 {
     const float value = clock.m_fEnd != 0.0f ? clock.m_fTime * kScrollRange / clock.m_fEnd : 0.0f;
@@ -94,7 +100,7 @@ uint32_t CGaitConvertContent::ControlFacts() const
     return When(m_bSourceIsContainer || m_kSourceMotion.GetKeyCount() > 0, kSource) |
            When(source.m_bPlays, kSourcePlays) | When(source.m_fTime != 0.0f, kSourceMoved) |
            When(source.m_fTime < source.m_fEnd, kSourceAhead) |
-           When(m_bSourceIsContainer || m_kSourceMotion.GetLastFrame() != 0.0f, kSourceLong) |
+           When(m_bSourceIsContainer || HasSeveralFrames(m_kSourceMotion), kSourceLong) |
            When(m_kBaseMotion.GetKeyCount() > 0, kBase) | When(m_bConverted, kConverted) |
            When(m_bConverted && m_kResultMotion.GetKeyCount() > 0, kResult) |
            When(result.m_bPlays, kResultPlays) | When(!result.m_bPlays, kResultRests) |

@@ -34,14 +34,6 @@ std::string FindInFolder(const std::string& folder, const std::string& name)
     return {};
 }
 
-int ItemCount(const CCntComboExControl& list)
-{
-    int count = 0;
-    while (list.GetItemText(count))
-        ++count;
-    return count;
-}
-
 // The first entry of a name, or -1.
 int FindItem(const CCntComboExControl& list, const std::string& name)
 {
