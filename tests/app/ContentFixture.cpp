@@ -1,0 +1,319 @@
+#include "ContentFixture.h"
+
+#include "CKeyframeControl.h"
+#include "COrrinStream.h"
+#include "Paths.h"
+#include "Text.h"
+
+#include <algorithm>
+
+namespace gw {
+
+// ---- view
+
+void CScriptedView::SetScene(CNode* root, float frameStep, float lastFrame)
+{
+    m_kCalls.push_back(m_kNumber + (root ? ".SetScene " + std::string(root->NameView()) : ".SetScene null"));
+    m_spkScene = root;
+    m_bPlaying = false;
+    m_fTime = 0.0f;
+    m_fFrameStep = frameStep;
+    m_fLastFrame = lastFrame;
+}
+
+void CScriptedView::Seek(int position, int range)
+{
+    m_fTime = static_cast<float>(position) * End() / static_cast<float>(range);
+}
+
+void CScriptedView::Advance()
+{
+    if (!m_bPlaying)
+        return;
+    m_fTime += m_fFrameStep;
+    if (m_fTime >= End())
+    {
+        m_fTime = 0.0f;
+        m_bPlaying = false;
+    }
+}
+
+// ---- window
+
+EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButtons)
+{
+    m_kCalls.push_back("box " + std::to_string(id));
+    m_kBoxes.push_back(text);
+    const auto answer = m_kAnswers.find(id);
+    return answer == m_kAnswers.end() ? EAnswer::OK : answer->second;
+}
+
+std::optional<std::string> CScriptedWindow::AskOpenFile(const CFileDialogSetup& setup)
+{
+    m_kCalls.push_back("open *." + setup.defaultExtension + " in " + setup.initialFolder);
+    return m_kOpenAnswer;
+}
+
+std::optional<std::string> CScriptedWindow::AskSaveFile(const CFileDialogSetup& setup)
+{
+    m_kCalls.push_back("save *." + setup.defaultExtension);
+    return m_kSaveAnswer;
+}
+
+std::optional<CFolderChoice> CScriptedWindow::AskFolder(const CFileDialogSetup& setup)
+{
+    m_kCalls.push_back("folder in " + setup.initialFolder);
+    return m_kFolderAnswer;
+}
+
+std::unique_ptr<CMotionView> CScriptedWindow::CreateView(std::string_view child)
+{
+    auto view = std::make_unique<CScriptedView>(m_kCalls, std::string(child.substr(4)));
+    (child == "#cnt1" ? m_pkSource : m_pkResult) = view.get();
+    return view;
+}
+
+void CScriptedWindow::SetTimer(int id, int milliseconds)
+{
+    m_kCalls.push_back("timer " + std::to_string(id) + ' ' + std::to_string(milliseconds));
+}
+
+bool CScriptedWindow::OpenWebPage(const std::string& address)
+{
+    m_kCalls.push_back("web " + address);
+    return true;
+}
+
+std::set<std::string> CScriptedWindow::Enabled() const
+{
+    std::set<std::string> names;
+    for (const auto& [name, on] : m_kEnabled)
+    {
+        if (on)
+            names.insert(name);
+    }
+    return names;
+}
+
+// ---- platform
+
+std::string CScriptedPlatform::ReadSetting(const std::string& key) const
+{
+    const auto found = m_kSettings.find(key);
+    return found == m_kSettings.end() ? std::string() : found->second;
+}
+
+bool CScriptedPlatform::WriteSetting(const std::string& key, const std::string& value)
+{
+    m_kSettings[key] = value;
+    return true;
+}
+
+std::string CScriptedPlatform::ReadHostKey(const std::string& keyPath, const std::string& valueName) const
+{
+    const auto found = m_kHostKeys.find(keyPath + '/' + valueName);
+    return found == m_kHostKeys.end() ? std::string() : found->second;
+}
+
+bool CScriptedPlatform::MakeFolder(const std::string& path)
+{
+    return CreateFolder(path);
+}
+
+// ---- files
+
+const SourceBones kPoserBones{"hip", "lThigh", "lShin", "lFoot", "rThigh", "rShin", "rFoot"};
+const SourceBones kMaxBones{"Bip01", "L_Thigh", "L_Calf", "L_Foot", "R_Thigh", "R_Calf", "R_Foot"};
+
+namespace {
+
+std::string Leg(const std::string& x, const std::string& thigh, const std::string& calf,
+                const std::string& foot)
+{
+    return "JOINT " + thigh + "\n{\nOFFSET " + x + " -4 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nJOINT " +
+           calf + "\n{\nOFFSET 0 -40 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nJOINT " + foot +
+           "\n{\nOFFSET 0 -38 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nEnd Site\n{\nOFFSET 0 -4 "
+           "12\n}\n}\n}\n}\n";
+}
+
+constexpr const char* kTargetBones[][2] = {
+    {"LowerTorso", "GLOBAL"    },
+    {"Waist",      "LowerTorso"},
+    {"LPelvis",    "LowerTorso"},
+    {"LThigh",     "LPelvis"   },
+    {"LCalf",      "LThigh"    },
+    {"LFoot",      "LCalf"     },
+    {"RPelvis",    "LowerTorso"},
+    {"RThigh",     "RPelvis"   },
+    {"RCalf",      "RThigh"    },
+    {"RFoot",      "RCalf"     },
+};
+
+// A hip, a waist and two legs that hang down; one frame.
+std::string TargetText()
+{
+    std::string text =
+        "[Header]\nFileType htr\nDataType HTRS\nFileVersion 1\nNumSegments 10\nNumFrames 1\n"
+        "DataFrameRate 30\nEulerRotationOrder ZYX\nCalibrationUnits mm\nRotationUnits Degrees\n"
+        "GlobalAxisofGravity Y\nBoneLengthAxis Y\nScaleFactor 1.000000\n"
+        "[SegmentNames&Hierarchy]\n#CHILD\tPARENT\n";
+    std::string rest = "[BasePosition]\n#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength\n";
+    std::string data;
+    for (const auto& [bone, parent] : kTargetBones)
+    {
+        const bool isRoot = std::string_view(parent) == "GLOBAL";
+        const bool isThigh = std::string_view(bone).ends_with("Thigh");
+        text += std::string(bone) + ' ' + parent + '\n';
+        rest += std::string(bone) +
+                (isRoot    ? " 0 920 0"
+                 : isThigh ? (*bone == 'L' ? " 95 -40 0" : " -95 -40 0")
+                           : " 0 -400 0") +
+                " 0 0 0 400\n";
+        data += '[' + std::string(bone) + "]\n1 0 0 0 0 0 0 1\n";
+    }
+    return text + rest + data + "[EndOfFile]\n";
+}
+
+} // namespace
+
+std::string BvhText(const SourceBones& bones, int frameCount)
+{
+    std::string text =
+        "HIERARCHY\nROOT " + bones.hip +
+        "\n{\nOFFSET 0 0 0\nCHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation\n" +
+        Leg("9", bones.leftThigh, bones.leftCalf, bones.leftFoot) +
+        Leg("-9", bones.rightThigh, bones.rightCalf, bones.rightFoot) +
+        "}\nMOTION\nFrames: " + std::to_string(frameCount) + "\nFrame Time: 0.033333\n";
+    for (int frame = 0; frame < frameCount; ++frame)
+    {
+        const std::string n = std::to_string(5 * frame);
+        text += "0 8" + std::to_string(frame % 10) + ' ' + n + " 0 0 " + n + " 0 -" + n + " 0 0 " + n +
+                " 0 0 0 0 0 " + n + " 0 0 " + n + " 0 0 0 0\n";
+    }
+    return text;
+}
+
+std::string BoneMapText(const std::string& name, const SourceBones& bones)
+{
+    const std::string rows[][2] = {
+        {bones.hip,        "LowerTorso"},
+        {bones.leftThigh,  "LThigh"    },
+        {bones.leftCalf,   "LCalf"     },
+        {bones.leftFoot,   "LFoot"     },
+        {bones.rightThigh, "RThigh"    },
+        {bones.rightCalf,  "RCalf"     },
+        {bones.rightFoot,  "RFoot"     },
+    };
+    std::string text = name + "\nFrameRate 30\nPosition 0 0 0\n";
+    for (const auto& [source, target] : rows)
+        text += source + " <---> " + target + " 0,0,0,1,2,3\n";
+    return text;
+}
+
+std::set<std::string> Words(std::string_view text)
+{
+    std::set<std::string> words;
+    for (std::string_view word = NextWord(text); !word.empty(); word = NextWord(text))
+        words.emplace(word);
+    return words;
+}
+
+// ---- fixture
+
+ContentTest::ContentTest()
+{
+    Write("data/base.htr", TargetText());
+    Write("data/PoserBVH.prf", BoneMapText("Poser", kPoserBones));
+    Write("data/MaxBVH.prf", BoneMapText("3DS MAX", kMaxBones));
+    Write("docs/BVH Profile/Custom0.prf", BoneMapText("Mine", kPoserBones));
+    m_kContent.OnInitContent();
+}
+
+std::string ContentTest::Write(const std::string& name, const std::string& text) const
+{
+    const std::string path = m_kFolder.Path(name);
+    CreateFolder(SplitPath(path).folder);
+    WriteBytes(path, text);
+    return path;
+}
+
+std::string ContentTest::Read(const std::string& name) const
+{
+    return ReadBytes(m_kFolder.Path(name));
+}
+
+bool ContentTest::Exists(const std::string& name) const
+{
+    return FileExists(m_kFolder.Path(name));
+}
+
+std::string ContentTest::WriteContainer(const std::string& name, bool withTrack) const
+{
+    Ref<CNode> hip = new CNode;
+    hip->SetName("hip");
+    if (withTrack)
+    {
+        Ref<CKeyframeControl> track = new CKeyframeControl;
+        track->m_kKeyTimes = {0.0f, 1.0f};
+        track->m_kRotationKeys.assign(2, kQuatIdentity);
+        track->m_fEndTime = 1.0f;
+        hip->AttachControl(track.Get());
+    }
+    COrrinStream stream;
+    stream.AddRoot(hip.Get());
+    EXPECT_TRUE(stream.SaveFile(m_kFolder.Path(name)));
+    return m_kFolder.Path(name);
+}
+
+int ContentTest::Open(const std::string& path)
+{
+    m_kWindow.m_kOpenAnswer = path;
+    return m_kContent.OpenSource();
+}
+
+void ContentTest::Do(std::string_view steps)
+{
+    while (!steps.empty())
+    {
+        std::string_view step = NextToken(steps, ",");
+        const std::string verb(NextWord(step));
+        const std::string object(NextWord(step));
+        if (verb == "open")
+            Open(m_kFolder.Path(object));
+        else if (verb == "click")
+            m_kContent.ChildClick(object);
+        else
+            SelectProfile(object);
+    }
+}
+
+void ContentTest::OpenAndConvert()
+{
+    ASSERT_EQ(Open(Write("walk.bvh", BvhText(kPoserBones))), 1);
+    ASSERT_EQ(m_kContent.ConvertMotion(), 1);
+    m_kWindow.TakeCalls();
+}
+
+int ContentTest::SaveAs(const std::string& name)
+{
+    m_kWindow.m_kSaveAnswer = m_kFolder.Path(name);
+    return m_kContent.SaveResult();
+}
+
+void ContentTest::SelectProfile(const std::string& name)
+{
+    for (int index = 0; const std::string* text = m_kWindow.m_kList.GetItemText(index); ++index)
+    {
+        if (*text == name)
+            m_kWindow.m_kList.SetCurSel(index);
+    }
+    m_kContent.OnCntCommand(9);
+}
+
+std::string ContentTest::SelectedProfile() const
+{
+    const std::string* text = m_kWindow.m_kList.GetItemText(m_kWindow.m_kList.GetCurSel());
+    return text ? *text : std::string();
+}
+
+} // namespace gw

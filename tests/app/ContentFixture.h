@@ -1,0 +1,181 @@
+#pragma once
+
+#include "CCntComboExControl.h"
+#include "CContentWindow.h"
+#include "CGaitConvertContent.h"
+#include "CPlatform.h"
+#include "TempFolder.h"
+
+#include <functional>
+#include <gtest/gtest.h>
+#include <map>
+#include <set>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// A view with a clock and no picture. Calls go into the window's list, with the view's number before them.
+class CScriptedView : public CMotionView
+{
+public:
+    CScriptedView(std::vector<std::string>& calls, std::string number)
+        : m_kCalls(calls), m_kNumber(std::move(number))
+    {
+    }
+
+    void SetScene(CNode* root, float frameStep, float lastFrame) override;
+    void SeekStart() override { m_fTime = 0.0f; }
+    void SeekEnd() override { m_fTime = End(); }
+    void Stop() override { m_bPlaying = false; }
+    void StepBack() override { m_fTime = std::max(0.0f, m_fTime - m_fFrameStep); }
+    void Play() override { m_bPlaying = true; }
+    void StepForward() override { m_fTime = std::min(End(), m_fTime + m_fFrameStep); }
+    void Seek(int position, int range) override;
+    void Advance() override;
+    bool IsPlaying() const override { return m_bPlaying; }
+    float GetTime() const override { return m_fTime; }
+    float GetFrameStep() const override { return m_fFrameStep; }
+    float GetLastFrame() const override { return m_fLastFrame; }
+    void SetHighlight(const std::string& boneName) override { m_kHighlight = boneName; }
+    void Repaint() override {}
+
+    Ref<CNode> m_spkScene;
+    std::string m_kHighlight;
+
+private:
+    float End() const { return m_fFrameStep * m_fLastFrame; }
+
+    std::vector<std::string>& m_kCalls;
+    std::string m_kNumber;
+    float m_fTime = 0.0f;
+    float m_fFrameStep = 0.0f;
+    float m_fLastFrame = 0.0f;
+    bool m_bPlaying = false;
+};
+
+/// A window that answers from a script and writes down what it was asked.
+class CScriptedWindow : public CContentWindow
+{
+public:
+    EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
+    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
+    std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
+    bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
+    void Report(const CReport& report) override { m_kReports.push_back(report); }
+    void ShowBatchFile(size_t, size_t, const std::string& path) override
+    {
+        if (m_kOnBatchFile)
+            m_kOnBatchFile(path);
+    }
+    void BeginWaitCursor() override { ++m_iWaits; }
+    void EndWaitCursor() override { --m_iWaits; }
+    void PostCloseRequest() override { m_kCalls.emplace_back("close"); }
+    void EnableChild(std::string_view child, bool on) override { m_kEnabled[std::string(child)] = on; }
+    void SetChildFace(std::string_view, int face) override { m_iPlayFace = face; }
+    void SetChildButtonState(std::string_view, bool on) override { m_bButtonState = on; }
+    bool GetChildButtonState(std::string_view) const override { return m_bButtonState; }
+    void SetChildScrollValue(std::string_view, int value) override { m_iScrollValue = value; }
+    void SetChildText(std::string_view, const std::string& text) override { m_kTitles.push_back(text); }
+    std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
+    CCntComboExControl& ProfileCombo() override { return m_kList; }
+    void SetTimer(int id, int milliseconds) override;
+    void KillTimer(int id) override { m_kCalls.push_back("kill " + std::to_string(id)); }
+    void ShowInFileManager(const std::string& path) override { m_kCalls.push_back("show " + path); }
+    void OpenHelpFile(const std::string& path) override { m_kCalls.push_back("help " + path); }
+    bool OpenWebPage(const std::string& address) override;
+
+    /// The enabled children, with blanks between them, in no order that matters.
+    std::set<std::string> Enabled() const;
+    /// What was called since the last time.
+    std::vector<std::string> TakeCalls() { return std::exchange(m_kCalls, {}); }
+
+    std::optional<std::string> m_kOpenAnswer;
+    std::optional<std::string> m_kSaveAnswer;
+    std::optional<CFolderChoice> m_kFolderAnswer;
+    std::map<int, EAnswer> m_kAnswers; ///< by message; all others are answered with OK
+    std::set<EKey> m_kKeys;
+    std::function<void(const std::string& path)>
+        m_kOnBatchFile; ///< what happens while a batch takes up a file
+    CProfileList m_kList;
+    std::map<std::string, bool> m_kEnabled;
+    std::vector<CReport> m_kReports;
+    std::vector<std::string> m_kTitles;
+    std::vector<std::string> m_kBoxes; ///< texts of the message boxes
+    std::vector<std::string> m_kCalls;
+    CScriptedView* m_pkSource = nullptr;
+    CScriptedView* m_pkResult = nullptr;
+    int m_iWaits = 0;
+    int m_iPlayFace = 0;
+    int m_iScrollValue = 0;
+    bool m_bButtonState = false;
+};
+
+/// Settings in memory, folders in one temporary folder: data/ and docs/.
+class CScriptedPlatform : public CPlatform
+{
+public:
+    explicit CScriptedPlatform(const CTempFolder& folder) : m_kFolder(folder) {}
+
+    std::string ReadSetting(const std::string& key) const override;
+    bool WriteSetting(const std::string& key, const std::string& value) override;
+    std::string ReadHostKey(const std::string& keyPath, const std::string& valueName) const override;
+    std::string DocumentsFolder() const override { return m_kFolder.Path("docs"); }
+    std::string DataFolder() const override { return m_kFolder.Path("data/"); }
+    bool MakeFolder(const std::string& path) override;
+    uint32_t ThreadLocale() const override { return m_uiLocale; }
+
+    std::map<std::string, std::string> m_kSettings;
+    std::map<std::string, std::string> m_kHostKeys; ///< by "path/name"
+    uint32_t m_uiLocale = 1033;
+
+private:
+    const CTempFolder& m_kFolder;
+};
+
+/// The words of a text, in an order that does not matter.
+std::set<std::string> Words(std::string_view text);
+
+/// The bones of a source skeleton, from the hip to the feet.
+struct SourceBones
+{
+    std::string hip, leftThigh, leftCalf, leftFoot, rightThigh, rightCalf, rightFoot;
+};
+extern const SourceBones kPoserBones;
+extern const SourceBones kMaxBones;
+
+/// A BVH file that walks on the spot, and a profile that fits it.
+std::string BvhText(const SourceBones& bones, int frameCount = 3);
+std::string BoneMapText(const std::string& name, const SourceBones& bones);
+
+/// The state machine with a target skeleton, two stock profiles and a custom one, between a scripted window
+/// and a scripted platform.
+class ContentTest : public testing::Test
+{
+protected:
+    ContentTest();
+
+    /// Writes a file into the temporary folder and answers its path.
+    std::string Write(const std::string& name, const std::string& text) const;
+    std::string Read(const std::string& name) const;
+    bool Exists(const std::string& name) const;
+    /// Writes a container whose node and track are named as asked, and answers its path.
+    std::string WriteContainer(const std::string& name, bool withTrack = true) const;
+
+    int Open(const std::string& path);
+    /// What a user does, in order: "open walk.bvh, click play, select Mine".
+    void Do(std::string_view steps);
+    /// Opens a source and converts it with the stock profile that fits.
+    void OpenAndConvert();
+    int SaveAs(const std::string& name);
+    void SelectProfile(const std::string& name);
+    std::string SelectedProfile() const;
+
+    CTempFolder m_kFolder;
+    CScriptedPlatform m_kPlatform{m_kFolder};
+    CScriptedWindow m_kWindow;
+    CGaitConvertContent m_kContent{m_kWindow, m_kPlatform};
+};
+
+} // namespace gw

@@ -1,0 +1,139 @@
+// What lies on the disk after a save, and what the user is told.
+
+#include "ContentFixture.h"
+
+#include "CCustomData.h"
+#include "COrrinStream.h"
+#include "Paths.h"
+
+#include <cstring>
+#include <sys/stat.h>
+
+namespace gw {
+
+namespace {
+
+// The data block of a name in a package.
+std::span<const std::byte> DataOf(COrrinStream& package, const char* name)
+{
+    CObject* const found = package.GetRoot(1)->FindObject(name, nullptr, false);
+    const auto* data = RecordCast<CRawData>(found);
+    return data ? data->Data() : std::span<const std::byte>();
+}
+
+std::string TextOf(std::span<const std::byte> bytes)
+{
+    return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+}
+
+} // namespace
+
+TEST_F(ContentTest, APackageHoldsTheMotionAtFourTimesItsFrames)
+{
+    OpenAndConvert();
+    EXPECT_EQ(SaveAs("out.KINETRA"), 1);
+    COrrinStream package;
+    ASSERT_TRUE(package.LoadFile(m_kFolder.Path("out.KINETRA"), false));
+    float rates[2];
+    ASSERT_EQ(DataOf(package, "MotionInfo").size(), 16u);
+    std::memcpy(rates, DataOf(package, "MotionInfo").data() + 8, sizeof rates);
+    EXPECT_EQ(rates[0], 30.0f) << "the profile's rate";
+    EXPECT_EQ(rates[1], 60.0f);
+    EXPECT_NE(TextOf(DataOf(package, "MotionFile")).find("NumFrames 12"), std::string::npos);
+}
+
+TEST_F(ContentTest, FilesAfterASave)
+{
+    const struct
+    {
+        const char* what;
+        const char* name;
+        std::vector<std::string> files; // in the folder afterwards
+    } rows[] = {
+        {"a package leaves no HTR",          "a.Kinetra", {"a.Kinetra"}},
+        {"any other extension gives an HTR", "b.mot",     {"b.htr"}    },
+        {"an HTR",                           "c.htr",     {"c.htr"}    },
+        {"no extension",                     "d",         {"d.htr"}    },
+    };
+    OpenAndConvert();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const std::string folder = std::string("saved-") + row.name + '/';
+        CreateFolder(m_kFolder.Path(folder));
+        SaveAs(folder + row.name);
+        std::vector<std::string> files;
+        for (const char* extension : {".Kinetra", ".htr", ".mot", ".tmp", ""})
+        {
+            for (const std::string& file : FilesInFolder(m_kFolder.Path(folder), extension))
+                files.push_back(file);
+        }
+        EXPECT_EQ(files, row.files);
+        EXPECT_EQ(m_kWindow.TakeCalls().back(), "show " + m_kFolder.Path(folder + row.name));
+        EXPECT_TRUE(m_kContent.IsSaved());
+    }
+}
+
+TEST_F(ContentTest, AnHtrBesideThePackageStaysAsItWas)
+{
+    OpenAndConvert();
+    Write("out.htr", "somebody's own");
+    SaveAs("out.Kinetra");
+    EXPECT_EQ(Read("out.htr"), "somebody's own");
+    EXPECT_TRUE(Exists("out.Kinetra"));
+}
+
+TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
+{
+    OpenAndConvert();
+    const std::string path = Write("old.Kinetra", "old");
+    chmod(path.c_str(), 0444);
+    const struct
+    {
+        const char* what;
+        const char* name;
+        const char* code;
+    } rows[] = {
+        {"a read-only package",        "old.Kinetra",      "write-error"},
+        {"a folder that is not there", "none/out.Kinetra", "write-error"},
+        {"an HTR in such a folder",    "none/out.htr",     "write-error"},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        m_kWindow.m_kReports.clear();
+        EXPECT_EQ(SaveAs(row.name), 1);
+        EXPECT_TRUE(m_kContent.IsSaved()) << "the flag goes as if it had been written";
+        ASSERT_FALSE(m_kWindow.m_kReports.empty());
+        EXPECT_EQ(m_kWindow.m_kReports[0].code, row.code);
+        EXPECT_EQ(m_kWindow.m_kTitles.back().find("Gaitwright v2.0 - not saved: "), 0u)
+            << m_kWindow.m_kTitles.back();
+    }
+    EXPECT_EQ(Read("old.Kinetra"), "old");
+    EXPECT_TRUE(FilesInFolder(m_kFolder.Path(), ".htr").empty()) << "no intermediate file is left";
+    SaveAs("good.Kinetra");
+    EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+}
+
+TEST_F(ContentTest, AProfileWithoutAFrameRateWritesNothing)
+{
+    OpenAndConvert();
+    for (const char* rate : {"0", "-30", "x"})
+    {
+        SCOPED_TRACE(rate);
+        m_kContent.UseProfileFile(
+            Write("odd.prf", std::string("Odd\nFrameRate ") + rate + "\nhip <---> LowerTorso 0\n"));
+        EXPECT_FALSE(m_kContent.WriteResult(m_kFolder.Path("odd.Kinetra")));
+        EXPECT_FALSE(Exists("odd.Kinetra"));
+    }
+}
+
+TEST_F(ContentTest, TheFileIsShownOnlyWhenAskedFor)
+{
+    OpenAndConvert();
+    m_kWindow.m_kAnswers[171] = EAnswer::Cancel;
+    SaveAs("out.Kinetra");
+    EXPECT_EQ(m_kWindow.TakeCalls(), (std::vector<std::string>{"save *.Kinetra", "box 171"}));
+}
+
+} // namespace gw

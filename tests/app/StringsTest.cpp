@@ -1,0 +1,184 @@
+// Texts: the program's own, a library's, and words for failures.
+
+#include "ResourceFile.h"
+#include "TempFolder.h"
+
+#include "CResourceManager.h"
+#include "FailureWords.h"
+#include "StringTable.h"
+
+#include <gtest/gtest.h>
+#include <random>
+#include <set>
+
+namespace gw {
+
+namespace {
+
+constexpr uint32_t kGerman = 1031;
+constexpr uint32_t kAustrian = 3079;
+constexpr uint32_t kFrench = 1036;
+
+std::string Library()
+{
+    return ResourceFile({
+        {138,  kFrench, "Fichier invalide."             },
+        {138,  kGerman, "Ungültige Datei. \xe2\x82\xac"},
+        {139,  kGerman, "*"                             },
+        {144,  0,       "Neutral"                       },
+        {144,  kFrench, "Profil!"                       },
+        {171,  kGerman, "*no text in the table either"  },
+        {4711, kGerman, "new"                           },
+    });
+}
+
+bool Find(const std::string& file, uint32_t id, uint32_t locale, std::string& text)
+{
+    return FindResourceString(std::as_bytes(std::span(file)), id, locale, text);
+}
+
+} // namespace
+
+TEST(StringLibrary, StringsByIdAndLanguage)
+{
+    const std::string file = Library();
+    const struct
+    {
+        const char* what;
+        uint32_t id;
+        uint32_t locale;
+        const char* text; // empty when none is found
+    } rows[] = {
+        {"the locale's own",             138,  kGerman,   "Ungültige Datei. \xe2\x82\xac"},
+        {"another of the same language", 138,  kAustrian, "Ungültige Datei. \xe2\x82\xac"},
+        {"neutral before a foreign one", 144,  kGerman,   "Neutral"                       },
+        {"foreign rather than none",     138,  2052,      "Ungültige Datei. \xe2\x82\xac"},
+        {"an empty place in a block",    140,  kGerman,   ""                              },
+        {"a block that is not there",    9999, kGerman,   ""                              },
+    };
+    for (const auto& row : rows)
+    {
+        std::string text;
+        EXPECT_EQ(Find(file, row.id, row.locale, text), *row.text != '\0') << row.what;
+        EXPECT_EQ(text, row.text) << row.what;
+    }
+}
+
+TEST(StringLibrary, EveryPrefixIsRefusedOrGivesTheText)
+{
+    const std::string whole = Library();
+    for (size_t size = 0; size < whole.size(); ++size)
+    {
+        const std::vector<char> cut(whole.begin(),
+                                    whole.begin() + static_cast<ptrdiff_t>(size)); // a block of its own
+        std::string text;
+        const bool found = FindResourceString(std::as_bytes(std::span(cut)), 138, kGerman, text);
+        EXPECT_EQ(text, found ? "Ungültige Datei. \xe2\x82\xac" : "") << size;
+    }
+}
+
+TEST(StringLibrary, NoByteInTheFileIsTrusted)
+{
+    const std::string whole = Library();
+    std::mt19937 random(1);
+    for (int round = 0; round < 20000; ++round)
+    {
+        std::vector<char> bytes(whole.begin(), whole.end());
+        for (int i = 0; i < 3; ++i)
+            bytes[random() % bytes.size()] = static_cast<char>(random() % 4 == 0 ? 0xff : random());
+        std::string text;
+        FindResourceString(std::as_bytes(std::span(bytes)), 138, kGerman, text);
+        EXPECT_LE(text.size(), 3 * bytes.size());
+    }
+}
+
+TEST(ResourceManager, AStarLeavesATextToTheProgram)
+{
+    const CTempFolder folder;
+    WriteBytes(folder.Path("res.dll"), Library());
+    CResourceManager translated, plain;
+    translated.OpenLibrary(folder.Path("res.dll"), kGerman);
+    plain.OpenLibrary(folder.Path("none.dll"), kGerman);
+    const struct
+    {
+        const char* what;
+        const CResourceManager& manager;
+        int id;
+        bool found;
+        const char* text;
+    } rows[] = {
+        {"translated",          translated, 138,  true,  "Ungültige Datei. \xe2\x82\xac"},
+        {"a star",              translated, 139,  true,  "Save convertion result?"       },
+        {"not in the library",  translated, 137,  true,  "Unable to locate Kestro."      },
+        {"only in the library", translated, 4711, true,  "new"                           },
+        {"nowhere",             translated, 1,    false, ""                              },
+        {"no library",          plain,      138,  true,  "Invalid BVH file format."      },
+        {"no such message",     plain,      -5,   false, ""                              },
+    };
+    for (const auto& row : rows)
+    {
+        std::string text;
+        EXPECT_EQ(row.manager.LoadResString(row.id, text), row.found) << row.what;
+        EXPECT_EQ(text, row.text) << row.what;
+    }
+}
+
+TEST(StringTable, FormatsTakeNothingButTheirArguments)
+{
+    const std::string arguments[] = {"2", "walk"};
+    const struct
+    {
+        const char* format;
+        const char* text;
+    } rows[] = {
+        {"Batch Converting %d : %s", "Batch Converting 2 : walk"},
+        {"%s%s%s%s",                 "2walk"                    },
+        {"100% %n %5d",              "100% %n %5d"              },
+        {"%",                        "%"                        },
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(FormatText(row.format, arguments), row.text);
+}
+
+TEST(FailureWords, EveryReasonHasItsOwnCodeAndWords)
+{
+    std::set<std::string> codes, words;
+    int count = 0;
+    for (int reason = 0; reason <= static_cast<int>(EFailure::CutName); ++reason, ++count)
+    {
+        const CReport report = MakeReport("a.bvh", CFailure{static_cast<EFailure>(reason), 0, {}}, false);
+        codes.insert(report.code);
+        words.insert(report.words);
+    }
+    EXPECT_EQ(codes.size(), static_cast<size_t>(count));
+    EXPECT_EQ(words.size(), static_cast<size_t>(count));
+}
+
+TEST(FailureWords, AReportSaysWhereAndWhatToDo)
+{
+    const struct
+    {
+        const char* what;
+        const char* path;
+        CFailure failure;
+        const char* line;
+    } rows[] = {
+        {"a line",
+         "a.bvh",   {EFailure::BlankLine, 12, {}},
+         "a.bvh:12: an empty line between MOTION and Frames: ('gaitwright doctor --fix' writes a mended "
+         "copy)"                                                                                  },
+        {"a byte of a container",
+         "a.orn",   {EFailure::UnknownClass, 381, "CSpoon"},
+         "a.orn: byte 381: the file holds an object of a class that is not known here: \"CSpoon\""},
+        {"a name that would command a terminal",
+         "\x1b[2J", {EFailure::TooDeep, 0, "\x1b[31m"},
+         "\\x1b[2J: bones or objects are nested deeper than is supported: \"\\x1b[31m\""          },
+        {"the path is not said twice",
+         "a.htr",   {EFailure::NotRegular, 0, "a.htr"},
+         "a.htr: this is a folder or a device, not a file"                                        },
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(ReportLine(MakeReport(row.path, row.failure, false)), row.line) << row.what;
+}
+
+} // namespace gw

@@ -1,0 +1,250 @@
+// Opening, converting, discarding: the four states and what leads from one to the next.
+
+#include "ContentFixture.h"
+
+#include "CProfileEditorDialog.h"
+#include "FindBone.h"
+#include "Paths.h"
+
+namespace gw {
+
+TEST_F(ContentTest, ControlsFollowTheState)
+{
+    Write("walk.bvh", BvhText(kPoserBones));
+    Write("still.bvh", BvhText(kPoserBones, 0));
+    Write("other.bvh", BvhText({"a", "b", "c", "d", "e", "f", "g"}));
+    const std::string open = "convert end fend play %adv |playbar";
+    const std::string converted = open + " apply";
+    const struct
+    {
+        const char* what;
+        const char* steps;
+        std::string enabled;
+    } rows[] = {
+        {"nothing is open",       "",                        ""                                     },
+        {"no stock profile fits", "open other.bvh",          "play end fend |playbar"               },
+        {"a source without keys", "open still.bvh",          "%adv"                                 },
+        {"a stock profile fits",  "open walk.bvh",           open                                   },
+        {"the source plays",      "click play",              open + " stop"                         },
+        {"at its end",            "click play, click end",   "play back fback convert %adv |playbar"},
+        {"back at its start",     "click back",              open                                   },
+        {"converted",             "click convert",           converted + " play1 end1 NextFrm1"     },
+        {"the result plays",      "click play1",             converted + " stop1 end1 NextFrm1"     },
+        {"at its end",            "click stop1, click END1", converted + " play1 start1 PreFrm1"    },
+        {"a custom profile",      "select Mine",             converted + " play1 start1 PreFrm1 del"},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        Do(row.steps);
+        EXPECT_EQ(m_kWindow.Enabled(), Words(row.enabled));
+        EXPECT_EQ(m_kWindow.m_iWaits, 0);
+    }
+}
+
+TEST_F(ContentTest, ApplyKeepsItsStateUntilTheUpdateAfterAnOpen)
+{
+    OpenAndConvert();
+    m_kWindow.m_kAnswers[139] = EAnswer::No;
+    Open(m_kFolder.Path("walk.bvh"));
+    EXPECT_TRUE(m_kWindow.m_kEnabled["apply"]);
+    m_kContent.UpdateControls();
+    EXPECT_FALSE(m_kWindow.m_kEnabled["apply"]);
+}
+
+TEST_F(ContentTest, DiscardQuestion)
+{
+    const struct
+    {
+        const char* what;
+        EAnswer answer;
+        bool saves; // whether the save dialog is answered with a path
+        bool opened;
+        bool saved;
+    } rows[] = {
+        {"cancel keeps the result",      EAnswer::Cancel, false, false, false},
+        {"no drops it",                  EAnswer::No,     false, true,  false},
+        {"yes saves it",                 EAnswer::Yes,    true,  true,  true },
+        {"yes and then cancel loses it", EAnswer::Yes,    false, true,  false},
+    };
+    OpenAndConvert();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const std::string path = m_kFolder.Path("kept.Kinetra");
+        DeleteFile(path);
+        m_kWindow.m_kAnswers[139] = row.answer;
+        m_kWindow.m_kSaveAnswer = row.saves ? std::optional(path) : std::nullopt;
+        EXPECT_EQ(Open(m_kFolder.Path("walk.bvh")), row.opened ? 1 : 0);
+        EXPECT_EQ(m_kContent.IsConverted(), !row.opened);
+        EXPECT_EQ(Exists("kept.Kinetra"), row.saved);
+        if (row.opened)
+            m_kContent.ConvertMotion();
+    }
+}
+
+TEST_F(ContentTest, NothingIsAskedWhenNothingWouldBeLost)
+{
+    OpenAndConvert();
+    SaveAs("out.Kinetra");
+    m_kContent.ConvertMotion(); // a second conversion after a save counts as saved
+    m_kWindow.TakeCalls();
+    EXPECT_TRUE(m_kContent.ConfirmDiscard());
+    EXPECT_TRUE(m_kWindow.TakeCalls().empty());
+}
+
+TEST_F(ContentTest, OpeningTellsTheFolderAndReadsItBack)
+{
+    m_kWindow.m_kOpenAnswer = std::nullopt;
+    EXPECT_EQ(m_kContent.OpenSource(), 1) << "a cancelled dialog is no failure";
+    Open(Write("deep/walk.bvh", BvhText(kPoserBones)));
+    m_kWindow.TakeCalls();
+    m_kContent.OpenSource();
+    EXPECT_EQ(m_kWindow.TakeCalls().front(), "open *.bvh in " + m_kFolder.Path("deep/"));
+}
+
+TEST_F(ContentTest, AFailedOpenKeepsTheSource)
+{
+    const std::string container = WriteContainer("scene.orn");
+    const std::string whole = Read("scene.orn");
+    Write("cut.orn", whole.substr(0, whole.size() - 9));
+    WriteContainer("still.orn", false);
+    Write("words.bvh", "hello\n");
+    std::string blank = BvhText(kPoserBones);
+    Write("blank.bvh", blank.insert(blank.find("Frames:"), "\n"));
+    const struct
+    {
+        const char* what;
+        const char* file;
+        const char* code;
+    } rows[] = {
+        {"no such file",                 "none.bvh",  "not-found"      },
+        {"no motion in it",              "words.bvh", "missing-section"},
+        {"an empty line in a bad place", "blank.bvh", "blank-line"     },
+        {"a container without track",    "still.orn", "no-track"       },
+        {"a container cut short",        "cut.orn",   "truncated"      },
+    };
+    Open(Write("walk.bvh", BvhText(kPoserBones)));
+    const CNode* root = m_kContent.SourceRoot();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        m_kWindow.m_kReports.clear();
+        EXPECT_EQ(Open(m_kFolder.Path(row.file)), 0);
+        EXPECT_EQ(m_kContent.SourceRoot(), root);
+        EXPECT_EQ(m_kWindow.TakeCalls().back(), "box 138");
+        EXPECT_EQ(m_kWindow.m_iWaits, 0);
+        ASSERT_EQ(m_kWindow.m_kReports.size(), 1u);
+        EXPECT_EQ(m_kWindow.m_kReports[0].code, row.code) << m_kWindow.m_kReports[0].words;
+    }
+    EXPECT_EQ(Open(container), 1);
+}
+
+TEST_F(ContentTest, AContainerStaysTheSourceUntilABatchRuns)
+{
+    ASSERT_EQ(Open(WriteContainer("scene.orn")), 1);
+    EXPECT_EQ(m_kWindow.m_pkSource->GetLastFrame(), 1.0f);
+    const CNode* scene = m_kContent.SourceRoot();
+    ASSERT_EQ(Open(Write("only/walk.bvh", BvhText(kPoserBones))), 1);
+    EXPECT_EQ(m_kContent.SourceRoot(), scene);
+    EXPECT_EQ(m_kWindow.m_pkSource->m_spkScene.Get(), scene);
+
+    m_kWindow.m_kFolderAnswer = CFolderChoice{m_kFolder.Path("only/"), 1};
+    m_kContent.RunBatch();
+    EXPECT_NE(m_kContent.SourceRoot(), scene);
+}
+
+TEST_F(ContentTest, AContainerConverts)
+{
+    Write("data/MaxBVH.prf", "3DS MAX\nhip <---> LowerTorso 0,0,0\n");
+    ASSERT_EQ(Open(WriteContainer("scene.orn")), 1);
+    EXPECT_EQ(m_kContent.ConvertMotion(), 1);
+    EXPECT_EQ(m_kContent.ResultMotion().GetLastFrame(), 1.0f);
+}
+
+TEST_F(ContentTest, AProfileThatDoesNotFitStopsTheConversion)
+{
+    const std::string legs = "lThigh <---> LThigh 0\n";
+    const std::string hip = "hip <---> LowerTorso 0\n";
+    const struct
+    {
+        const char* what;
+        std::string rows;
+        const char* code;
+        const char* name;
+    } rows[] = {
+        {"no row for the root bone", legs,                             "no-root-row",    ""    },
+        {"a fixed row for it",       legs + "* LowerTorso . .1,2,3\n", "no-root-source", ""    },
+        {"a bone the source lacks",  hip + "hop <---> LThigh 0\n",     "no-source-bone", "hop" },
+        {"a bone the target lacks",  hip + "hip <---> Tail 0\n",       "no-target-bone", "Tail"},
+    };
+    OpenAndConvert();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        m_kWindow.m_kReports.clear();
+        m_kContent.UseProfileFile(
+            Write("docs/BVH Profile/Custom1.prf", std::string("Odd\nFrameRate 30\n") + row.rows));
+        m_kWindow.TakeCalls();
+        EXPECT_EQ(m_kContent.ConvertMotion(), 0);
+        EXPECT_EQ(m_kWindow.TakeCalls(), std::vector<std::string>{"box 144"});
+        EXPECT_TRUE(m_kContent.IsConverted()) << "the flag keeps its value";
+        ASSERT_EQ(m_kWindow.m_kReports.size(), 1u);
+        EXPECT_EQ(m_kWindow.m_kReports[0].code, row.code);
+        EXPECT_EQ(m_kWindow.m_kReports[0].name, row.name);
+    }
+}
+
+TEST_F(ContentTest, ShiftLeavesTheLegsOutAndNothingElse)
+{
+    OpenAndConvert();
+    const auto save = [&](const char* name) {
+        SaveAs(name);
+        return Read(name);
+    };
+    const auto section = [](const std::string& text, const std::string& bone) {
+        const size_t begin = text.find('[' + bone + ']');
+        return text.substr(begin, text.find("\n[", begin) - begin);
+    };
+    const std::string with = save("with.htr");
+    m_kWindow.m_kKeys = {EKey::LeftShift};
+    m_kContent.ConvertMotion();
+    const std::string without = save("without.htr");
+    EXPECT_EQ(section(with, "LowerTorso"), section(without, "LowerTorso"));
+    EXPECT_NE(section(with, "LThigh"), section(without, "LThigh"));
+}
+
+TEST_F(ContentTest, TheRestPoseStandsWhereTheMotionBegins)
+{
+    OpenAndConvert();
+    const CNode* root = FindBone(m_kContent.ResultMotion().restRoot.Get(), "LowerTorso");
+    ASSERT_NE(root, nullptr);
+    EXPECT_EQ(root->m_kMatrix.Translation(), kRootPosition);
+    EXPECT_EQ(m_kWindow.m_pkResult->m_spkScene, m_kContent.ResultMotion().motionRoot);
+}
+
+TEST_F(ContentTest, WithoutATargetSkeletonTheSourceStillShows)
+{
+    DeleteFile(m_kFolder.Path("data/base.htr"));
+    EXPECT_EQ(Open(Write("walk.bvh", BvhText(kPoserBones))), 1);
+    EXPECT_NE(m_kWindow.m_pkSource->m_spkScene, nullptr);
+    EXPECT_FALSE(m_kWindow.m_kEnabled["convert"]);
+    ASSERT_FALSE(m_kWindow.m_kReports.empty());
+    EXPECT_EQ(m_kWindow.m_kReports.front().path, m_kFolder.Path("data/base.htr"));
+}
+
+TEST_F(ContentTest, ClosingAsksTheEditorFirst)
+{
+    OpenAndConvert();
+    SelectProfile("Mine");
+    m_kContent.ProfileEditor()->MarkChanged();
+    m_kWindow.TakeCalls();
+    m_kWindow.m_kAnswers = {
+        {161, EAnswer::No    },
+        {139, EAnswer::Cancel}
+    };
+    EXPECT_FALSE(m_kContent.MayClose());
+    EXPECT_EQ(m_kWindow.TakeCalls(), (std::vector<std::string>{"box 161", "box 139"}));
+}
+
+} // namespace gw
