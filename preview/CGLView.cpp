@@ -1,0 +1,147 @@
+#include "CGLView.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr float kEyeDistance = 2.5f; // radii between eye and centre: the whole sphere fits into 45 degrees
+constexpr float kDragStep = 0.005f;  // radii that one pixel of the mouse moves
+
+} // namespace
+
+CGLView::CGLView() = default;
+CGLView::~CGLView() = default;
+
+void CGLView::SetScene(CNode* root, float frameStep, float lastFrame)
+{
+    Stop();
+    m_fTime = 0.0f;
+    m_fFrameStep = frameStep;
+    m_fLastFrame = lastFrame;
+    if (!(m_spkScene == root))
+    {
+        m_kMeshes.Clear();
+        m_spkScene = root;
+    }
+    FrameAll();
+    Repaint();
+}
+
+void CGLView::FrameAll()
+{
+    if (!m_spkScene)
+        return;
+    const BoundSphere& bound = m_spkScene->m_kBound;
+    // Near plane, far plane and angle of view, which cameras carry and nothing reads.
+    m_kCamera.m_afParameter[0] = 1.0f;
+    m_kCamera.m_afParameter[1] = 90'000.0f;
+    m_kCamera.m_afParameter[2] = 45.0f;
+    m_kCamera.m_kLookAt = bound.m_kCentre;
+    m_kCamera.m_kEye = bound.m_kCentre;
+    m_kCamera.m_kEye.z += kEyeDistance * bound.m_fRadius;
+    m_kCamera.m_kUp = kVec3UnitY;
+    m_kPan = kVec3Zero;
+}
+
+void CGLView::SeekStart()
+{
+    GoTo(0.0f);
+}
+
+void CGLView::SeekEnd()
+{
+    GoTo(End());
+}
+
+void CGLView::Stop()
+{
+    if (!m_spkScene)
+        return;
+    m_uiTimer = 0;
+    m_bPlaying = false;
+}
+
+void CGLView::StepBack()
+{
+    GoTo(std::max(m_fTime - m_fFrameStep, 0.0f));
+}
+
+void CGLView::Play()
+{
+    m_bPlaying = m_spkScene.Get() != nullptr;
+}
+
+void CGLView::StepForward()
+{
+    GoTo(std::min(m_fTime + m_fFrameStep, End()));
+}
+
+void CGLView::Seek(int position, int range)
+{
+    if (range > 0)
+        GoTo(std::min(static_cast<float>(position) * End() / static_cast<float>(range), End()));
+}
+
+void CGLView::Advance()
+{
+    if (!m_bPlaying)
+        return;
+    const float next = m_fTime + m_fFrameStep;
+    m_bPlaying = next < End();
+    GoTo(m_bPlaying ? next : 0.0f);
+}
+
+void CGLView::GoTo(float time)
+{
+    if (!m_spkScene)
+        return;
+    m_fTime = time;
+    m_spkScene->UpdateScene(time, true);
+    Repaint();
+}
+
+void CGLView::Repaint()
+{
+    if (m_kRepaint)
+        m_kRepaint();
+}
+
+void CGLView::MouseDown(int x, int y)
+{
+    m_iLastX = x;
+    m_iLastY = y;
+    m_bDragging = true;
+}
+
+void CGLView::MouseUp()
+{
+    m_bDragging = false;
+}
+
+void CGLView::MouseMove(int x, int y, DragKeys keys)
+{
+    if (!m_bDragging || !m_spkScene)
+        return;
+    const float unit = m_spkScene->m_kBound.m_fRadius * kDragStep;
+    const float dx = unit * static_cast<float>(m_iLastX - x);
+    const float dy = unit * static_cast<float>(m_iLastY - y);
+    m_iLastX = x;
+    m_iLastY = y;
+    if (keys.leftCtrl && !keys.leftShift)
+        m_kCamera.m_kEye.z = std::max(m_kCamera.m_kEye.z + dy, 0.0f);
+    else if (!keys.leftShift)
+        m_kPan = m_kPan + Vec3{-dx, dy, 0.0f};
+    Repaint();
+}
+
+const CDrawList& CGLView::DrawScene()
+{
+    m_kDrawList.Clear();
+    if (m_spkScene)
+        BuildDrawList(m_kDrawList, m_kMeshes.Of(*m_spkScene), m_spkScene->m_kBound.m_fRadius, m_kHighlight);
+    return m_kDrawList;
+}
+
+} // namespace gw
