@@ -11,6 +11,16 @@ namespace gw {
 
 using testing::ElementsAre;
 
+namespace {
+
+std::string Describe(const CMissingBone& bone)
+{
+    const char* side = bone.side == ESkeletonSide::Source ? " source " : " target ";
+    return std::to_string(bone.line) + side + bone.name + ' ' + bone.nearest;
+}
+
+} // namespace
+
 TEST_F(ProfileEditor, ApplyingFillsTheTablesWithWhatDiffers)
 {
     Load("N\nA x LowerTorso 0,0,0,1,2,3\nB x Waist 10,-20,30,1,2,3\nc x HEAD 0,0,0,-1,3,2\n");
@@ -44,28 +54,22 @@ TEST_F(ProfileEditor, OneMissingBoneFailsTheProfileAndSparesTheOtherRows)
     {
         const char* what;
         const char* lines;
-        int matched;
-        int total;
+        const char* verdict;
         bool rootMapping;
     } rows[] = {
-        {"source missing",       "None x LowerTorso 0\nA x Head 0\n",   3, 4, true },
-        {"target missing",       "B x None 0\nA x Head 0\n",            3, 4, false},
-        {"fixed target missing", "* None . .1,2,3\nA x Head 0\n",       3, 4, false},
-        {"all there, no root",   "A x Head 0\n",                        3, 3, false},
-        {"fixed root counts",    "* lowertorso . .1,2,3\nA x Head 0\n", 4, 4, true },
+        {"source missing",       "None x LowerTorso 0\nA x Head 0\n",   "3 of 4, misfit", true },
+        {"target missing",       "B x None 0\nA x Head 0\n",            "3 of 4, misfit", false},
+        {"fixed target missing", "* None . .1,2,3\nA x Head 0\n",       "3 of 4, misfit", false},
+        {"all there, no root",   "A x Head 0\n",                        "3 of 3, fits",   false},
+        {"fixed root counts",    "* lowertorso . .1,2,3\nA x Head 0\n", "4 of 4, fits",   true },
     };
     for (const auto& row : rows)
     {
-        SCOPED_TRACE(row.what);
         m_kEditor.LoadProfile(MakeProfile(std::string("N\n") + row.lines));
         m_kEditor.RebuildSourceTree();
-        int matched = -1;
-        int total = -1;
-        EXPECT_EQ(m_kEditor.ApplyProfile(nullptr, &matched, &total), row.matched == row.total);
-        EXPECT_EQ(matched, row.matched);
-        EXPECT_EQ(total, row.total);
-        EXPECT_EQ(m_kEditor.HasRootMapping(), row.rootMapping);
-        EXPECT_TRUE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("A")));
+        EXPECT_EQ(Apply(), row.verdict) << row.what;
+        EXPECT_EQ(m_kEditor.HasRootMapping(), row.rootMapping) << row.what;
+        EXPECT_TRUE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("A"))) << row.what;
     }
 }
 
@@ -135,48 +139,40 @@ TEST(ProfileFit, NamesTheSideTheLineAndTheNearestBone)
                      "* Rthig . .1,2,3\nqqqqqqqq x Unknown 0\n");
     CProfileFit fit;
     ASSERT_TRUE(MeasureFit(path, source.Get(), target.Get(), fit));
-    EXPECT_EQ(fit.name, "Fit");
-    EXPECT_EQ(fit.rowCount, 6) << "four targets of the file and the two pelvis bones";
-    EXPECT_EQ(fit.foundCount, 2);
-    EXPECT_FALSE(fit.drivesRoot);
-    EXPECT_FALSE(fit.IsWhole());
     std::vector<std::string> missing;
     for (const CMissingBone& bone : fit.missing)
-        missing.push_back(std::to_string(bone.line) +
-                          (bone.side == ESkeletonSide::Source ? " source " : " target ") + bone.name + " " +
-                          bone.nearest);
+        missing.push_back(Describe(bone));
     EXPECT_THAT(missing, ElementsAre("3 source Hip Hips", "6 target Rthig RThigh", "7 source qqqqqqqq ",
                                      "7 target Unknown ", "0 target RPelvis LPelvis"));
+    EXPECT_EQ(fit.name, "Fit");
+    EXPECT_EQ(fit.rowCount, 6) << "four targets of the file and the two pelvis bones";
     EXPECT_FALSE(MeasureFit(folder.Path("none.prf"), source.Get(), target.Get(), fit));
-    EXPECT_EQ(fit.rowCount, 6) << "left alone";
+    EXPECT_EQ(fit.foundCount, 2) << "left alone";
 }
 
-TEST(ProfileFit, AgreesWithApplyingTheProfile)
+TEST_F(ProfileEditor, MeasuredFitAgreesWithApplying)
 {
-    CScriptedOwner owner;
-    const Ref<CNode> source = MakeChain({"A", "B"});
-    const Ref<CNode> target = MakeChain({"LowerTorso", "Head", "LPelvis", "RPelvis"});
-    CProfileEditorDialog editor(owner);
-    editor.SetSourceScene(source.Get());
-    editor.SetResultScene(target.Get());
-    for (const char* lines : {"A x LowerTorso 0\n", "* LowerTorso . .1,2,3\n", "a x Head 0\nB x head 0\n\n",
-                              "C x LowerTorso 0\nA x LPelvis 0\n", "\n* RPelvis\n* None\n"})
+    const struct
     {
-        SCOPED_TRACE(lines);
-        const std::string path = owner.ProfileFile("a.prf");
-        WriteBytes(path, std::string("N\nFrameRate 30\n") + lines);
-        editor.LoadProfile(path);
-        int matched = 0;
-        int total = 0;
-        const bool applied = editor.ApplyProfile(nullptr, &matched, &total);
+        const char* lines;
+        bool drivesRoot;
+    } rows[] = {
+        {"A x LowerTorso 0\n",                   true },
+        {"* LowerTorso . .1,2,3\n",              false},
+        {"a x Head 0\nB x head 0\n\n",           false},
+        {"None x LowerTorso 0\nA x LPelvis 0\n", false},
+        {"\n* RPelvis\n* None\n",                false},
+    };
+    for (const auto& row : rows)
+    {
+        Load(std::string("N\nFrameRate 30\n") + row.lines);
         CProfileFit fit;
-        ASSERT_TRUE(MeasureFit(path, source.Get(), target.Get(), fit));
-        EXPECT_EQ(fit.foundCount, matched);
-        EXPECT_EQ(fit.rowCount, total);
-        EXPECT_EQ(fit.missing.empty(), applied);
-        EXPECT_EQ(MeasureFit(editor.Rows(), source.Get(), target.Get()).foundCount, matched);
-        EXPECT_TRUE(editor.HasRootMapping() || !fit.drivesRoot);
+        MeasureFit(m_kEditor.ProfilePath(), m_spkSource.Get(), m_spkTarget.Get(), fit);
+        const char* verdict = fit.missing.empty() ? ", fits" : ", misfit";
+        EXPECT_EQ(Apply(), std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + verdict);
+        EXPECT_EQ(fit.drivesRoot, row.drivesRoot) << row.lines;
     }
+    EXPECT_EQ(MeasureFit(m_kEditor.Rows(), m_spkSource.Get(), m_spkTarget.Get()).missing.size(), 1u);
 }
 
 } // namespace gw

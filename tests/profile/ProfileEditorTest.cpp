@@ -6,7 +6,18 @@
 namespace gw {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
+
+namespace {
+
+std::string Joined(const std::vector<std::string>& messages)
+{
+    std::string text;
+    for (const std::string& message : messages)
+        text += (text.empty() ? "" : ", ") + message;
+    return text;
+}
+
+} // namespace
 
 TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
 {
@@ -23,22 +34,17 @@ TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
         {"no number",               kFrameRateField, "fast",        "30",     "157 30 240"      },
         {"offset too low",          kOffsetXField,   "-10001",      "-10000", "157 -10000 10000"},
         {"beyond 32 bits",          kOffsetZField,   "99999999999", "10000",  "157 -10000 10000"},
-        {"at the limit",            kOffsetYField,   "10000",       "10000",  nullptr           },
-        {"what follows counts not", kFrameRateField, "60 fps",      "60",     nullptr           },
+        {"at the limit",            kOffsetYField,   "10000",       "10000",  ""                },
+        {"what follows counts not", kFrameRateField, "60 fps",      "60",     ""                },
     };
     for (const auto& row : rows)
     {
-        SCOPED_TRACE(row.what);
         CProfileEditorDialog editor(m_kOwner);
         editor.EditField(row.field, row.text);
-        editor.CommitFields(EFieldCommit::Check);
-        EXPECT_EQ(editor.GetFrameRate(), 30) << "checking stores nothing";
-        EXPECT_FALSE(editor.IsDirty());
         editor.LeaveField();
-        EXPECT_EQ(editor.FieldText(row.field), row.shown);
-        EXPECT_TRUE(editor.IsDirty() || std::string(row.shown) == "30");
-        const auto messages = m_kOwner.TakeMessages();
-        EXPECT_EQ(messages, row.message ? std::vector<std::string>{row.message} : std::vector<std::string>{});
+        EXPECT_EQ(editor.FieldText(row.field), row.shown) << row.what;
+        EXPECT_EQ(editor.IsDirty(), std::string(row.shown) != "30") << row.what;
+        EXPECT_EQ(Joined(m_kOwner.TakeMessages()), row.message) << row.what;
     }
 }
 
@@ -52,14 +58,13 @@ TEST_F(ProfileEditor, RenameIsTakenOrRefusedWhole)
         const char* what;
         std::string typed;
         std::string name;
-        bool refused;
-        bool dirty;
+        std::string messages;
     } rows[] = {
-        {"free name",        "New one ", "New one", false, true },
-        {"taken name",       "stock",    "Mine",    true,  false},
-        {"empty name",       "  ",       "Mine",    true,  false},
-        {"case alone",       "MINE",     "Mine",    false, true },
-        {"cut at the limit", e65,        e64,       false, true },
+        {"free name",        "New one ", "New one", ""   },
+        {"taken name",       "stock",    "Mine",    "158"},
+        {"empty name",       "  ",       "Mine",    "158"},
+        {"case alone",       "MINE",     "Mine",    ""   },
+        {"cut at the limit", e65,        e64,       ""   },
     };
     for (const auto& row : rows)
     {
@@ -73,14 +78,17 @@ TEST_F(ProfileEditor, RenameIsTakenOrRefusedWhole)
         std::string name;
         editor.GetProfileName(name);
         EXPECT_EQ(name, row.name);
-        EXPECT_EQ(editor.IsDirty(), row.dirty);
-        if (row.refused)
-        {
-            EXPECT_THAT(m_kOwner.TakeMessages(), ElementsAre("158"));
-            EXPECT_EQ(editor.FieldText(kNameField), "Mine");
-        }
-        EXPECT_THAT(m_kOwner.TakeMessages(), IsEmpty());
+        EXPECT_EQ(editor.IsDirty(), row.messages.empty());
+        EXPECT_EQ(Joined(m_kOwner.TakeMessages()), row.messages);
     }
+}
+
+TEST_F(ProfileEditor, RefusedNameGivesWayToTheOldOne)
+{
+    Load("Mine\n");
+    m_kEditor.EditField(kNameField, "");
+    m_kEditor.LeaveField();
+    EXPECT_EQ(m_kEditor.FieldText(kNameField), "Mine");
 }
 
 TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
@@ -106,15 +114,18 @@ TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
         SelectBones(row.source, row.target);
         EXPECT_EQ(m_kEditor.Buttons().addToMap, row.addToMap) << row.what;
     }
+}
+
+TEST_F(ProfileEditor, AddToMapAddsARowAndMarksItsBones)
+{
     SelectBones("B", "Head");
     m_kEditor.ClickButton(kAddToMapButton);
-    EXPECT_EQ(RowText(m_kEditor.Rows(), 3), "B|Head|0|0|0|||");
+    EXPECT_THAT(RowTexts(m_kEditor.Rows()),
+                ElementsAre("B|Head|0|0|0|||", "[FIXED]|LPelvis|0|0|0|||", "[FIXED]|RPelvis|0|0|0|||"));
     EXPECT_FALSE(m_kEditor.Buttons().addToMap) << "both are mapped now";
     EXPECT_TRUE(m_kEditor.Buttons().saveProfile);
-    const CBoneTree& tree = m_kEditor.TargetTree();
-    EXPECT_EQ(tree.Image(tree.Selected()), 4);
     EXPECT_EQ(m_kEditor.SourceTree().Image(m_kEditor.SourceTree().Selected()), 1);
-    EXPECT_EQ(tree.SelectedImage(tree.Selected()), 3);
+    EXPECT_EQ(m_kEditor.TargetTree().Image(m_kEditor.TargetTree().Selected()), 4);
 }
 
 TEST_F(ProfileEditor, RowButtonsFollowTheSelection)
@@ -189,7 +200,6 @@ TEST_F(ProfileEditor, RemovedRowsFreeTheirBones)
 TEST_F(ProfileEditor, BoneOffsetChangesTheSelectedRow)
 {
     Load("N\nA x Waist 1,2,3\nB x Head 4,5,6,-1,3,2\n");
-    EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "nothing is selected";
     m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog& dialog) {
         dialog.LeaveRotation(0, "70");
         dialog.ChooseAxis(0, 5);
@@ -203,8 +213,12 @@ TEST_F(ProfileEditor, BoneOffsetChangesTheSelectedRow)
     m_kEditor.SelectOnlyRow(0);
     EXPECT_TRUE(m_kEditor.EditBoneOffset());
     EXPECT_EQ(RowText(m_kEditor.Rows(), 0), "A|Waist|1|2|3|-Z| Y| X") << "the first row keeps its rotation";
+}
 
+TEST_F(ProfileEditor, BoneOffsetWithoutAChangeLeavesTheRow)
+{
     Load("N\nA x Waist 1,2,3\n");
+    EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "nothing is selected";
     m_kEditor.SelectOnlyRow(0);
     m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog&) { return true; };
     EXPECT_TRUE(m_kEditor.EditBoneOffset());

@@ -64,6 +64,15 @@ std::vector<std::string> RowTexts(const CMapRowTable& rows)
     return texts;
 }
 
+namespace {
+
+std::string Verdict(bool fits, int matched, int total)
+{
+    return std::to_string(matched) + " of " + std::to_string(total) + (fits ? ", fits" : ", misfit");
+}
+
+} // namespace
+
 ProfileEditor::ProfileEditor()
     : m_spkSource(MakeChain({"A", "B", "C"})),
       m_spkTarget(MakeChain({"LowerTorso", "Waist", "Head", "LPelvis", "RPelvis"}))
@@ -91,6 +100,29 @@ void ProfileEditor::SelectBones(const std::string& source, const std::string& ta
 {
     m_kEditor.SelectSourceItem(m_kEditor.FindSourceItem(source));
     m_kEditor.SelectTargetItem(m_kEditor.FindTargetItem(target));
+}
+
+std::string ProfileEditor::Count(const std::string& path)
+{
+    int matched = -1;
+    int total = -1;
+    const bool fits = m_kEditor.CountMatches(path, &matched, &total);
+    return Verdict(fits, matched, total);
+}
+
+std::string ProfileEditor::Apply()
+{
+    int matched = -1;
+    int total = -1;
+    const bool fits = m_kEditor.ApplyProfile(nullptr, &matched, &total);
+    return Verdict(fits, matched, total);
+}
+
+std::string ProfileEditor::Name() const
+{
+    std::string name;
+    m_kEditor.GetProfileName(name);
+    return name;
 }
 
 } // namespace gw

@@ -57,6 +57,11 @@ protected:
     bool Load(const std::string& text) { return m_kEditor.LoadProfile(MakeProfile(text)); }
     void MakeReadOnly(const std::string& path);
     void SelectBones(const std::string& source, const std::string& target);
+    /// Counts the matches of a file, as "1 of 2, fits" or "1 of 2, misfit".
+    std::string Count(const std::string& path);
+    /// Applies the profile without a retargeter, as "3 of 4, fits" or "3 of 4, misfit".
+    std::string Apply();
+    std::string Name() const;
 
     CScriptedOwner m_kOwner;
     Ref<CNode> m_spkSource;

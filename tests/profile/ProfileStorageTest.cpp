@@ -29,9 +29,7 @@ TEST_F(ProfileEditor, LoadReplacesRowsAndKeepsWhatTheFileDoesNotSay)
 {
     EXPECT_TRUE(Load("First\nFrameRate 60\nPosition 1 2 3\nA <---> Head 1,2,3,-1,3,2\n"));
     EXPECT_TRUE(Load("Second \n* Waist . .-1,3,2\n"));
-    std::string name;
-    m_kEditor.GetProfileName(name);
-    EXPECT_EQ(name, "Second");
+    EXPECT_EQ(Name(), "Second");
     EXPECT_EQ(m_kEditor.GetFrameRate(), 60);
     EXPECT_EQ(m_kEditor.FieldText(kNameField), "Second");
     EXPECT_EQ(m_kEditor.FieldText(kOffsetYField), "2");
@@ -54,34 +52,25 @@ TEST_F(ProfileEditor, CountersAndAnswerTellHowAFileFits)
     {
         const char* what;
         const char* lines;
-        int matched;
-        int total;
-        bool answer;
+        const char* verdict;
     } rows[] = {
-        {"no rows",              "",                                         0, 0, true },
-        {"both found",           "A x Head 0\nB x Waist 0\n",                2, 2, true },
-        {"names without case",   "a x HEAD 0\n",                             1, 1, true },
-        {"source missing",       "A x Head 0\nNone x Waist 0\n",             1, 2, false},
-        {"target missing",       "A x None 0\n",                             0, 1, true },
-        {"both missing",         "No x None 0\n",                            0, 1, true },
-        {"fixed rows count not", "* Head . .1,2,3\n* None . .1,2,3\n",       0, 0, true },
-        {"a blank line repeats", "A x Head 0\n\n",                           2, 2, true },
-        {"keywords count not",   "FrameRate 60\nPosition 1 2 3\nA x Head\n", 1, 1, true },
+        {"no rows",              "",                                         "0 of 0, fits"  },
+        {"both found",           "A x Head 0\nB x Waist 0\n",                "2 of 2, fits"  },
+        {"names without case",   "a x HEAD 0\n",                             "1 of 1, fits"  },
+        {"source missing",       "A x Head 0\nNone x Waist 0\n",             "1 of 2, misfit"},
+        {"target missing",       "A x None 0\n",                             "0 of 1, fits"  },
+        {"both missing",         "No x None 0\n",                            "0 of 1, fits"  },
+        {"fixed rows count not", "* Head . .1,2,3\n* None . .1,2,3\n",       "0 of 0, fits"  },
+        {"a blank line repeats", "A x Head 0\n\n",                           "2 of 2, fits"  },
+        {"keywords count not",   "FrameRate 60\nPosition 1 2 3\nA x Head\n", "1 of 1, fits"  },
     };
     for (const auto& row : rows)
-    {
-        int matched = -1;
-        int total = -1;
-        const std::string path = MakeProfile(std::string("N\n") + row.lines);
-        EXPECT_EQ(m_kEditor.CountMatches(path, &matched, &total), row.answer) << row.what;
-        EXPECT_EQ(matched, row.matched) << row.what;
-        EXPECT_EQ(total, row.total) << row.what;
-        EXPECT_EQ(m_kEditor.CountMatches(path, nullptr, nullptr), row.answer) << row.what;
-    }
+        EXPECT_EQ(Count(MakeProfile(std::string("N\n") + row.lines)), row.verdict) << row.what;
+    EXPECT_FALSE(m_kEditor.CountMatches(MakeProfile("N\nNone x Head 0\n"), nullptr, nullptr))
+        << "no counters";
     CProfileEditorDialog noScenes(m_kOwner);
-    int matched = -1;
-    EXPECT_TRUE(noScenes.CountMatches(MakeProfile("N\nA x Head 0\n"), &matched, nullptr));
-    EXPECT_EQ(matched, 0) << "without scenes nothing is found";
+    EXPECT_TRUE(noScenes.CountMatches(MakeProfile("N\nA x Head 0\n"), nullptr, nullptr))
+        << "nothing is found";
 }
 
 TEST_F(ProfileEditor, MereCountChangesNameAndPathAndNothingElse)
@@ -90,9 +79,7 @@ TEST_F(ProfileEditor, MereCountChangesNameAndPathAndNothingElse)
     const auto rows = RowTexts(m_kEditor.Rows());
     const std::string other = MakeProfile("Other\nFrameRate 90\nPosition 7 7 7\nB x Waist 0\n", "Other.prf");
     m_kEditor.CountMatches(other, nullptr, nullptr);
-    std::string name;
-    m_kEditor.GetProfileName(name);
-    EXPECT_EQ(name, "Other");
+    EXPECT_EQ(Name(), "Other");
     EXPECT_EQ(m_kEditor.ProfilePath(), other);
     EXPECT_EQ(RowTexts(m_kEditor.Rows()), rows);
     EXPECT_EQ(m_kEditor.GetFrameRate(), 60);
