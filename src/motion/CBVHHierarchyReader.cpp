@@ -86,7 +86,9 @@ bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
     joint.name = NextToken(rest);
     if (joint.name.size() > kNameLimit || (joint.name.empty() && joint.kind != EJointKind::EndSite))
         return Fail(EFailure::BadName, joint.name);
-    if (!NextToken(rest).empty())
+    // A brace that stands here is missed below, which is worth more words than a name of two.
+    const std::string_view more = NextToken(rest);
+    if (!more.empty() && more != "{")
         m_kRecord.Warn(EFailure::CutName, m_kLines.LineNumber(), joint.name);
     return true;
 }

@@ -4,9 +4,6 @@
 #include "CNode.h"
 #include "Skeleton.h"
 
-#include <cmath>
-#include <limits>
-
 namespace gw {
 
 namespace {
@@ -60,18 +57,7 @@ void CMotionSampler::PoseTree(float time)
 
 float TimeOfFrame(int i, float frequency, float frameScale)
 {
-    const float time = static_cast<float>(i) / (frequency * frameScale);
-    const float frame = static_cast<float>(i) / frameScale;
-    if (frame != std::floor(frame))
-        return time;
-    // On a key: of the neighbours that differ in the last place, one often gives the key's own time.
-    for (const float towards : {0.0f, std::numeric_limits<float>::infinity()})
-    {
-        const float neighbour = std::nextafter(time, towards);
-        if (time * frequency != frame && neighbour * frequency == frame)
-            return neighbour;
-    }
-    return time;
+    return static_cast<float>(i) / (frequency * frameScale);
 }
 
 } // namespace gw

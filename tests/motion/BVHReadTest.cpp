@@ -1,0 +1,256 @@
+// What the grammar of a BVH file takes and refuses.
+
+#include "CKeyframeControl.h"
+#include "COrrinStream.h"
+#include "MotionTexts.h"
+#include "Skeleton.h"
+
+#include <gmock/gmock.h>
+
+namespace gw {
+namespace {
+
+// The small file with one piece of text replaced.
+std::string Small(std::string_view from = {}, std::string_view to = {})
+{
+    std::string text(kSmallBVH);
+    const size_t at = text.find(from);
+    EXPECT_NE(at, text.npos) << from;
+    return text.replace(at, from.size(), to);
+}
+
+std::string Chain(size_t depth)
+{
+    std::string text = "HIERARCHY\nROOT J\n{\n";
+    for (size_t i = 1; i < depth; ++i)
+        text += "JOINT J\n{\n";
+    for (size_t i = 0; i < depth; ++i)
+        text += "}\n";
+    return text + "MOTION\nFrames: 0\nFrame Time: 1\n";
+}
+
+// What a table changes about the small file. An empty `from` stands for the whole text.
+struct Change
+{
+    const char* what;
+    std::string from;
+    std::string to;
+};
+
+std::string Changed(const Change& change)
+{
+    return change.from.empty() ? change.to : Small(change.from, change.to);
+}
+
+TEST(TKBVHStream, ReadsTheSameMotionWhateverMeansNothing)
+{
+    const Change rows[] = {
+        {"CR LF and a byte order mark",        "",              "\xef\xbb\xbf" + WithCarriageReturns(kSmallBVH)},
+        {"CR LF on some lines",                "Hips\n{\n",     "Hips\r\n{\r\n"                                },
+        {"text before and after",              "",              "a note\n\n" + Small() + "\nmore\n1 2\n"       },
+        {"unknown and blank lines in a block", "\tOFFSET 0 10", "\n\tCOLOUR red\n\tOFFSET 0 10"                },
+        {"commas in a row",                    "11 21 31 10",   ",11,21, 31,,10"                               },
+        {"tabs and blanks around a row",       "11 21 31 10",   "\t 11 \t21\t31 10"                            },
+        {"numbers of every form",              "11 21 31 10",   "+11. 0.21e2 31.000000000000000000000 1.0E+01" },
+        {"no line end behind the last row",    "0 0 0 90\n",    "0 0 0 90"                                     },
+        {"surplus values",                     "40 50 60",      "40 50 60 70 80"                               },
+    };
+    CLoadedMotion plain(kSmallBVH, "a.bvh");
+    const Mat4 expected = PosedNode(plain.motion, "Chest", 1).m_kWorldMatrix;
+    for (const Change& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CLoadedMotion file(Changed(row), "a.bvh");
+        ASSERT_TRUE(file.loaded);
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), "Hips(Chest)");
+        EXPECT_EQ(file.motion.GetKeyCount(), 3);
+        EXPECT_EQ(PosedNode(file.motion, "Chest", 1).m_kWorldMatrix, expected);
+        EXPECT_EQ(RecordText(file.motion.Record()), "");
+    }
+}
+
+TEST(TKBVHStream, MakesNodesOfRootAndJoints)
+{
+    const struct
+    {
+        Change change;
+        std::string tree;
+        int keyCount;
+    } rows[] = {
+        {{"a joint called Site", "JOINT Chest", "JOINT Site"},                     "Hips(Site)",       3},
+        {{"a joint below an end site", "\t\t\tOFFSET 0 0 5", "JOINT Tip\n{\n}\n"}, "Hips(Chest)",      3},
+        {{"a joint outside all blocks", "MOTION", "JOINT Tail\n{\n}\nMOTION"},     "Hips(Chest Tail)", 3},
+        {{"two roots", "MOTION", "ROOT Prop\n{\nCHANNELS 1 Xrotation\n}\nMOTION"}, "Hips(Chest)",      3},
+        {{"scale channels have no effect", "3 Xrotation", "3 Xscale"},             "Hips(Chest)",      3},
+        {{"surplus rows", "Frames: 3", "Frames: 2"},                               "Hips(Chest)",      2},
+        {{"no frames", "Frames: 3", "Frames: 0"},                                  "Hips(Chest)",      0},
+        {{"less than no frames", "Frames: 3", "Frames: -7"},                       "Hips(Chest)",      0},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.change.what);
+        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        EXPECT_TRUE(file.loaded);
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
+        EXPECT_EQ(file.motion.GetKeyCount(), row.keyCount);
+    }
+}
+
+TEST(TKBVHStream, WarnsAndReadsOn)
+{
+    const struct
+    {
+        Change change;
+        std::string record;
+    } rows[] = {
+        {{"name of three words", "ROOT Hips", "ROOT Hips of mine"}, "CutName 2 Hips\n"            },
+        {{"unknown channel", "3 Xrotation Y", "3 Xrotation W"},     "UnknownChannel 9 Wrotation\n"},
+        {{"offset with an end", "OFFSET 1 2 3", "OFFSET 1 2 3;"},   "StuckNumber 4 3;\n"          },
+        {{"two numbers in one", "12 22 32", "12 22.5-7 32"},        "StuckNumber 21 22.5-7\n"     },
+        {{"short row", "40 50 60", "40 50"},                        "ShortRow 20 Chest\n"         },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.change.what);
+        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        EXPECT_TRUE(file.loaded);
+        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+    }
+}
+
+TEST(TKBVHStream, RefusesWithReasonAndLine)
+{
+    const std::string longName(256, 'n');
+    const struct
+    {
+        Change change;
+        std::string record;
+    } rows[] = {
+        {{"no bytes", "", ""},                                          "MissingSection 0 HIERARCHY"    },
+        {{"other text", "", "a letter\nto you\n"},                      "MissingSection 2 HIERARCHY"    },
+        {{"hierarchy alone", "", "HIERARCHY\nROOT a\n{\n}\n"},          "MissingSection 4 MOTION"       },
+        {{"motion alone", "", "MOTION\nFrames: 1\nFrame Time: 1\n1\n"}, "NoRoot 1 ROOT"                 },
+        {{"hierarchy without a root", "", "HIERARCHY\nMOTION\n"},       "NoRoot 2 ROOT"                 },
+        {{"joint before any root", "", "HIERARCHY\nJOINT a\n{\n}\n"},   "NoRoot 2 a"                    },
+        {{"root without a name", "ROOT Hips", "ROOT "},                 "BadName 2 "                    },
+        {{"name too long", "JOINT Chest", "JOINT " + longName},         "BadName 6 " + longName.substr(0, 80)},
+        {{"two opening braces", "\tOFFSET 1", "{\n\tOFFSET 1"},                                                             "BadBrace 4 {"                                        },
+        {{"no opening brace", "{\n\tOFFSET 1", "\tOFFSET 1"},                                                             "BadBrace 14 }"  },
+        {{"brace behind the name", "Hips\n{", "Hips {"},                                                             "BadBrace 14 }"                                             },
+        {{"block without an end", "}\nMOTION", "MOTION"},                                                             "BadBrace 15 }" },
+        {{"short offset", "OFFSET 0 10 0", "OFFSET 0 10"},                                                             "MissingTokens 8 Chest"                                            },
+        {{"word as offset", "OFFSET 0 10 0", "OFFSET 0 ten 0"},                                                             "BadNumber 8 ten"},
+        {{"endless offset", "OFFSET 0 10 0", "OFFSET 0 1e39 0"},                                                             "BadNumber 8 1e39"                                           },
+        {{"fewer channels than counted", "6 Xposition", "7 Xposition"},                                                             "MissingTokens 5 Hips"},
+        {{"absurd count of channels", "6 Xposition", "2000000000 Xposition"},                                                             "MissingTokens 5 Hips"                                     },
+        {{"no count of channels", "CHANNELS 3", "CHANNELS Xrotation"},                                                             "BadNumber 9 Xrotation"},
+        {{"blank line behind MOTION", "Frames: 3", "\nFrames: 3"},                                                             "BlankLine 17 Frames:"                                         },
+        {{"blank line before the frame time", "Frame Time", "\r\nFrame Time"},                                                             "BlankLine 18 Frame Time:"},
+        {{"other line behind MOTION", "Frames: 3", "Frames 3"},                                                             "UnexpectedLine 17 Frames:"                                                        },
+        {{"frame time of one word", "Frame Time:", "FrameTime:"},                                                             "UnexpectedLine 18 Frame Time:"},
+        {{"no count of frames", "Frames: 3", "Frames:"},                                                             "MissingTokens 17 Frames:"                                                                 },
+        {{"word as count of frames", "Frames: 3", "Frames: x"},                                                             "BadNumber 17 x"},
+        {{"frame time 0", "0.04", "0"},                                                             "BadNumber 18 0"                                                                                         },
+        {{"frame time below 0", "0.04", "-0.04"},                                                             "BadNumber 18 -0.04"},
+        {{"frame time no number", "0.04", "nan"},                                                             "BadNumber 18 nan"                                                                                         },
+        {{"frame time too small for a float", "0.04", "1e-99"},                                                             "BadNumber 18 1e-99"},
+        {{"fewer rows than frames", "Frames: 3", "Frames: 4"},                                                             "TooFewRows 17 Frames:"                                                                                          },
+        {{"absurdly many frames", "Frames: 3", "Frames: 2000000000"},                                                             "TooFewRows 17 Frames:"},
+        {{"row too short for the root", "10 20 30 0 0 0 0 0 0", "10 20 30 0 0"},                                                             "MissingTokens 19 Hips"                                                                               },
+        {{"blank row", "11 21", "\n11 21"},                                                             "BlankLine 20 "},
+        {{"word in a row", "31 10", "31 ten"},                                                             "BadNumber 20 ten"                                                                            },
+        {{"not a number in a row", "31 10", "31 -nan"},                                                             "BadNumber 20 -nan"},
+        {{"infinity in a row", "31 10", "31 inf"},                                                             "BadNumber 20 inf"                                                                                 },
+        {{"number too big for a float", "31 10", "31 4e38"},                                                             "BadNumber 20 4e38"},
+        {{"nested too deep", "", Chain(kNestingLimit)},                                                             "TooDeep 8000 J"                                                                                      },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.change.what);
+        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        EXPECT_FALSE(file.loaded);
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), "");
+        EXPECT_EQ(RecordText(file.motion.Record()), "failed " + row.record + "\n");
+    }
+    EXPECT_TRUE(CLoadedMotion(Chain(kNestingLimit - 1), "a.bvh").loaded);
+}
+
+// A row is one line of the file however long it is, and a number that a buffer would cut is whole.
+TEST(TKBVHStream, ReadsRowsOfAnyLength)
+{
+    constexpr int kJoints = 800;
+    std::string text = "HIERARCHY\nROOT J\n{\nCHANNELS 1 Xposition\n";
+    std::string row = "0.5";
+    for (int i = 1; i < kJoints; ++i)
+    {
+        text += "JOINT J" + std::to_string(i) + "\n{\nCHANNELS 1 Xposition\n}\n";
+        row.append(" ").append(std::to_string(1000000 + i));
+    }
+    const CLoadedMotion file(text + "}\nMOTION\nFrames: 1\nFrame Time: 1\n" + row + "\n", "a.bvh");
+    ASSERT_TRUE(file.loaded);
+    ASSERT_GT(row.size(), 4096u);
+    const std::vector<CNode*> nodes = NodesOf(*file.motion.motionRoot);
+    ASSERT_EQ(nodes.size(), size_t{kJoints});
+    for (size_t i = 1; i < nodes.size(); ++i)
+        ASSERT_EQ(nodes[i]->m_kMatrix.Translation().x, static_cast<float>(1000000 + i)) << i;
+}
+
+// Values that a short row leaves out move the later ones up, so that keys are one fewer and the last one is
+// filled up.
+TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)
+{
+    const std::string motion = "MOTION\nFrames: 3\nFrame Time: 1\n0 1 2\n0 3\n0 4 5\n";
+    const CLoadedMotion file("HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nCHANNELS 2 Xposition "
+                             "Yposition\n}\n}\n" +
+                                 motion,
+                             "a.bvh");
+    ASSERT_TRUE(file.loaded);
+    CNode* const joint = FindNode(file.motion.motionRoot.Get(), "J");
+    const auto& keys = static_cast<CKeyframeControl*>(joint->GetControl())->m_kPositionKeys;
+    EXPECT_THAT(keys, testing::ElementsAre(Vec3{1, 2, 0}, Vec3{3, 4, 0}, Vec3{5, 0, 0}));
+    EXPECT_EQ(file.motion.GetKeyCount(), 3);
+}
+
+TEST(TKBVHStream, WarnsOfPositionsThatRepeatTheOffsets)
+{
+    const struct
+    {
+        const char* what;
+        std::string offset;
+        std::string position;
+        std::string record;
+    } rows[] = {
+        {"repeated",          "0 10 0", "0 10 0",      "DoubledOffsets 14 J\n"},
+        {"all but repeated",  "0 10 0", "0.01 9.99 0", "DoubledOffsets 14 J\n"},
+        {"moved from there",  "0 10 0", "0 11 0",      ""                     },
+        {"nothing to repeat", "0 0 0",  "0 0 0",       ""                     },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CLoadedMotion file(
+            "HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nOFFSET " + row.offset +
+                "\nCHANNELS 3 Xposition Yposition Zposition\n}\n}\nMOTION\nFrames: 1\nFrame Time: "
+                "1\n7 " +
+                row.position + "\n",
+            "a.bvh");
+        EXPECT_TRUE(file.loaded);
+        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+    }
+}
+
+TEST(TKBVHStream, EveryPrefixIsTakenOrRefused)
+{
+    const CTempFolder folder;
+    for (size_t length = 0; length <= kSmallBVH.size(); ++length)
+    {
+        CMotionFile motion;
+        WriteBytes(folder.Path("a.bvh"), kSmallBVH.substr(0, length));
+        const bool loaded = motion.Load(folder.Path("a.bvh"));
+        EXPECT_NE(loaded, static_cast<bool>(motion.Record().Failure())) << length << " bytes";
+        EXPECT_TRUE(!loaded || IsFinite(*motion.motionRoot)) << length << " bytes";
+    }
+}
+
+} // namespace
+} // namespace gw

@@ -1,0 +1,91 @@
+#pragma once
+
+#include "CMotionFile.h"
+#include "TempFolder.h"
+
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+/// A motion that was loaded from a text through a file of its own.
+struct CLoadedMotion
+{
+    CLoadedMotion(std::string_view text, const std::string& fileName);
+
+    CTempFolder folder;
+    std::string path;
+    CMotionFile motion;
+    bool loaded;
+};
+
+/// A tree of nodes as text, children in brackets: "Hips(Spine(Head) Leg)". Empty for null.
+std::string TreeText(CNode* root);
+/// The failure and the warnings of a record as text, one a line: reason, line and name.
+std::string RecordText(const CFailureRecord& record);
+/// Brings a motion to a frame; the node must exist.
+const CNode& PosedNode(CMotionFile& motion, const char* name, int frame);
+/// Whether all matrices of a tree hold finite numbers.
+bool IsFinite(CNode& root);
+
+/// A text with its lines' ends changed to CR LF.
+std::string WithCarriageReturns(std::string_view text);
+
+/// Two joints of three frames: rotation orders of their own, an end site.
+inline constexpr std::string_view kSmallBVH = R"(HIERARCHY
+ROOT Hips
+{
+	OFFSET 1 2 3
+	CHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation
+	JOINT Chest
+	{
+		OFFSET 0 10 0
+		CHANNELS 3 Xrotation Yrotation Zrotation
+		End Site
+		{
+			OFFSET 0 0 5
+		}
+	}
+}
+MOTION
+Frames: 3
+Frame Time: 0.04
+10 20 30 0 0 0 0 0 0
+11 21 31 10 20 30 40 50 60
+12 22 32 -90 45 0 0 0 90
+)";
+
+/// Two segments of two frames.
+inline constexpr std::string_view kSmallHTR = R"([Header]
+FileType htr
+DataType HTRS
+FileVersion 3
+NumSegments 2
+NumFrames 2
+DataFrameRate 25
+EulerRotationOrder ZYX
+CalibrationUnits mm
+RotationUnits Degrees
+GlobalAxisofGravity Y
+BoneLengthAxis Y
+ScaleFactor 1.000000
+[SegmentNames&Hierarchy]
+#CHILD	PARENT
+Torso GLOBAL
+Head Torso
+[BasePosition]
+#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength
+Torso 0 100 0 0 0 90 50
+Head 0 50 0 10 20 30 20
+#Beginning of Data. Separated by tabs
+[Torso]
+#Fr	Tx	Ty	Tz	Rx	Ry	Rz	SF
+1 1 2 3 0 0 0 1
+2 4 5 6 10 20 30 2
+[Head]
+#Fr	Tx	Ty	Tz	Rx	Ry	Rz	SF
+1 0 0 0 0 0 0 1
+2 0 0 0 -5 15 25 1
+)";
+
+} // namespace gw
