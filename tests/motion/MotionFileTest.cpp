@@ -1,0 +1,176 @@
+// The facade: which stream a name chooses, what a failed call leaves, and what a locale may not change.
+
+#include "MotionTexts.h"
+#include "Paths.h"
+#include "TKBVHStream.h"
+
+#include <clocale>
+#include <cstdlib>
+#include <gtest/gtest.h>
+#include <limits>
+
+namespace gw {
+namespace {
+
+TEST(CMotionFile, ChoosesByTheExtension)
+{
+    const struct
+    {
+        const char* name;
+        std::string_view text;
+        const char* tree;
+    } rows[] = {
+        {"a.bvh",     kSmallBVH, "Hips(Chest)"},
+        {"a.Bvh",     kSmallBVH, "Hips(Chest)"},
+        {"a.BVH",     kSmallBVH, "Hips(Chest)"},
+        {"a.bvh.htr", kSmallHTR, "Torso(Head)"},
+        {".htr",      kSmallHTR, "Torso(Head)"},
+        {"a.htr.bvh", kSmallHTR, ""           },
+        {"a.txt",     kSmallBVH, ""           },
+        {"bvh",       kSmallBVH, ""           },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.name);
+        const CLoadedMotion file(row.text, row.name);
+        EXPECT_EQ(file.loaded, *row.tree != '\0');
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
+        EXPECT_EQ(static_cast<bool>(file.motion.restRoot), file.loaded && row.text == kSmallHTR);
+        EXPECT_NE(file.loaded, static_cast<bool>(file.motion.Record().Failure()));
+    }
+}
+
+TEST(CMotionFile, KeepsItsTreesWhenALoadFails)
+{
+    CLoadedMotion file(kSmallHTR, "a.htr");
+    ASSERT_TRUE(file.loaded);
+    const Ref<CNode> motion = file.motion.motionRoot;
+    const Ref<CNode> rest = file.motion.restRoot;
+    WriteBytes(file.folder.Path("bad.htr"), "[Header]\n");
+    WriteBytes(file.folder.Path("other.txt"), "no motion");
+    const struct
+    {
+        std::string path;
+        bool loaded;
+        const char* record;
+    } rows[] = {
+        {"",                            false, "failed NotFound 0 \n"                              },
+        {file.folder.Path("none.bvh"),  false, "failed NotFound 0 \n"                              },
+        {file.folder.Path("bad.htr"),   false, "failed MissingSection 1 [SegmentNames&Hierarchy]\n"},
+        {file.folder.Path("other.txt"), true,  ""                                                  },
+        {file.folder.Path("none.txt"),  true,  ""                                                  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.path);
+        motion->UpdateScene(1.0f, true);
+        EXPECT_EQ(file.motion.Load(row.path), row.loaded);
+        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+        EXPECT_TRUE(file.motion.motionRoot == motion && file.motion.restRoot == rest);
+        const Vec3 first{1, 102, 3};
+        EXPECT_EQ(motion->m_kMatrix.Translation() == first, row.loaded) << "stands at time 0 again";
+    }
+    WriteBytes(file.folder.Path("good.bvh"), kSmallBVH);
+    ASSERT_TRUE(file.motion.Load(file.folder.Path("good.bvh")));
+    EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), "Hips(Chest)");
+    EXPECT_TRUE(file.motion.restRoot == rest) << "only an HTR brings another rest pose";
+}
+
+TEST(CMotionFile, WritesNothingItCannotWriteWhole)
+{
+    CLoadedMotion htr(kSmallHTR, "a.htr");
+    const CLoadedMotion bvh(kSmallBVH, "a.bvh");
+    CMotionFile withoutRest(bvh.motion);
+    const struct
+    {
+        CMotionFile& motion;
+        std::string name;
+        float frameScale;
+        const char* record;
+    } rows[] = {
+        {htr.motion,  "b.bvh",      1.0f,                                    "failed UnknownFormat 0 \n"},
+        {htr.motion,  "b",          1.0f,                                    "failed UnknownFormat 0 \n"},
+        {htr.motion,  "none/b.htr", 1.0f,                                    "failed WriteError 0 \n"   },
+        {htr.motion,  "b.htr",      1e30f,                                   "failed TooLarge 0 \n"     },
+        {htr.motion,  "b.htr",      std::numeric_limits<float>::quiet_NaN(), "failed TooLarge 0 \n"     },
+        {withoutRest, "b.htr",      1.0f,                                    "failed NoRoot 0 \n"       },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.name + row.record);
+        EXPECT_FALSE(row.motion.Save(htr.folder.Path(row.name), row.frameScale));
+        EXPECT_EQ(RecordText(row.motion.Record()), row.record);
+        for (const char* extension : {".htr", ".bvh", ".tmp", ""})
+        {
+            const size_t own = std::string_view(extension) == ".htr" ? 1 : 0;
+            EXPECT_EQ(FilesInFolder(htr.folder.Path(), extension).size(), own) << extension;
+        }
+    }
+    EXPECT_FALSE(htr.motion.Save("", 1.0f));
+    EXPECT_EQ(htr.motion.GetKeyCount(), 2) << "the motion is still there";
+}
+
+TEST(CMotionFile, NamesWhatIsNoTPose)
+{
+    const auto arms = [](const std::string& left, const std::string& right) {
+        const auto arm = [](const std::string& side, const std::string& along, const char* offset) {
+            return "JOINT " + side + "Arm\n{\nOFFSET " + offset + "\nJOINT " + side + "ForeArm\n{\nOFFSET " +
+                   along + "\nJOINT " + side + "Hand\n{\nOFFSET " + along + "\nJOINT " + side +
+                   "HandThumb\n{\n}\n}\n}\n}\n";
+        };
+        return "HIERARCHY\nROOT Chest\n{\n" + arm("Left", left, "2 0 9") + arm("Right", right, "-2 0 9") +
+               "}\nMOTION\nFrames: 0\nFrame Time: 1\n";
+    };
+    const struct
+    {
+        const char* what;
+        std::string text;
+        const char* record;
+    } rows[] = {
+        {"both sideways",       arms("5 0 0",   "-5 0 0"),                        ""},
+        {"a little down",                     arms("5 0 -2",                     "-5 0 -2"),                    ""},
+        {"hanging",                   arms("0 0 -5",                                 "0 0 -5"),                                      "RestPose 0 LeftArm\n"},
+        {"half way down",            arms("5 0 -5","-5 0 -5"),"RestPose 0 LeftArm\n"},
+        {"one of them hanging",arms("5 0 0",                              "0 0 -5"),                                                                          "RestPose 0 LeftArm\n"},
+        {"crossed", arms("-5 0 0",       "5 0 0"), "RestPose 0 LeftArm\n"},
+        {"no arms",                     std::string(kSmallBVH),                           ""                                             },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CLoadedMotion file(row.text, "a.bvh");
+        EXPECT_TRUE(file.loaded);
+        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+    }
+}
+
+// The texts written from two small motions.
+std::string WrittenTexts()
+{
+    CLoadedMotion htr(kSmallHTR, "a.htr");
+    CLoadedMotion bvh(kSmallBVH, "a.bvh");
+    EXPECT_TRUE(htr.motion.Save(htr.path, 1.5f));
+    EXPECT_TRUE(TKBVHStream(bvh.motion).WriteFile(bvh.path));
+    return ReadBytes(htr.path) + ReadBytes(bvh.path);
+}
+
+TEST(CMotionFile, NoLocaleChangesAByte)
+{
+    const CTempFolder folder;
+    const std::string make =
+        "localedef -i de_DE -f UTF-8 --no-archive " + folder.Path("de_DE.UTF-8") + " >/dev/null 2>&1";
+    const std::string plain = WrittenTexts();
+    if (std::system(make.c_str()) != 0)
+        return;
+    setenv("LOCPATH", folder.Path().c_str(), 1);
+    const bool german = std::setlocale(LC_ALL, "de_DE.UTF-8") != nullptr;
+    const std::string written = WrittenTexts();
+    const bool comma = std::string_view(std::localeconv()->decimal_point) == ",";
+    std::setlocale(LC_ALL, "C");
+    unsetenv("LOCPATH");
+    EXPECT_EQ(german, comma);
+    EXPECT_EQ(written, plain);
+}
+
+} // namespace
+} // namespace gw
