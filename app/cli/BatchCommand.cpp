@@ -32,7 +32,7 @@ bool SelectProfile(const COptions& options, CShellWindow& window, CShellContent&
     CProfileFit best;
     const bool selected = content.SelectFittingProfile(best);
     if (!selected)
-        SayNoneFits(first, best);
+        window.Report(NoneFitsReport(first, best));
     return selected;
 }
 

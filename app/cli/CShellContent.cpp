@@ -2,6 +2,7 @@
 
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
+#include "CReport.h"
 #include "FitWords.h"
 #include "Paths.h"
 #include "ProfileFile.h"
@@ -25,11 +26,13 @@ std::vector<std::string> NamesOf(const std::vector<CInstalledProfile>& profiles)
     return names;
 }
 
-void SayNotInstalled(const std::string& name, const std::vector<CInstalledProfile>& profiles)
+CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfile>& profiles)
 {
     const std::string nearest = NearestName(name, NamesOf(profiles));
     const std::string guess = nearest.empty() ? "" : "; did you mean " + Quoted(nearest) + '?';
-    SayError("no profile " + Quoted(name) + " is installed" + guess + " ('gaitwright profiles' lists them)");
+    return ShellFailure({}, "not-installed",
+                        "no profile " + Quoted(name) + " is installed" + guess +
+                            " ('gaitwright profiles' lists them)");
 }
 
 } // namespace
@@ -70,9 +73,9 @@ std::string CShellContent::ResolveProfile(const std::string& nameOrFile)
     if (ReadProfileText(nameOrFile, text))
         return nameOrFile;
     if (HasExtension(nameOrFile, ".prf") || FileExists(nameOrFile))
-        SayError(Printable(nameOrFile) + ": the profile cannot be read");
+        m_kWindow.Report(ShellFailure(nameOrFile, "profile", "the profile cannot be read"));
     else
-        SayNotInstalled(nameOrFile, InstalledProfiles());
+        m_kWindow.Report(NotInstalled(nameOrFile, InstalledProfiles()));
     return {};
 }
 

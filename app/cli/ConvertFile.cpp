@@ -31,60 +31,109 @@ struct Account
     std::optional<CProfileFit> misfit;
 };
 
-bool SelectProfile(const COptions& options, const CConversionJob& job, CShellContent& content,
-                   Account& account)
+// One run of the state machine, step by step. Each step answers whether the next may follow.
+class CConversion
 {
-    if (!options.profile.empty())
-        return content.SelectProfile(options.profile);
-    CProfileFit best;
-    if (content.SelectFittingProfile(best))
-        return true;
-    SayNoneFits(job.source, best);
-    account.misfit = best;
-    return false;
-}
-
-// The state of the window's button is the rule; here only the reason is looked for.
-bool MayConvert(const CShellWindow& window, const CConversionJob& job)
-{
-    if (window.IsEnabled("convert"))
-        return true;
-    if (!window.HasFailed())
-        SayError(Printable(job.source) + ": the motion has no frames; there is nothing to convert");
-    return false;
-}
-
-bool Convert(const CConversionJob& job, CShellWindow& window, CShellContent& content, Account& account)
-{
-    window.PassOverMissingBones();
-    if (content.ConvertMotion() != 0)
-        return true;
-    CProfileFit fit;
-    if (content.Measure(content.ProfilePath(), fit))
+public:
+    CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
+        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account),
+          m_kPlatform(EPlatformWriting::No, options.dataFolder), m_kContent(window, m_kPlatform)
     {
-        SayMisfit(job.source, fit);
-        account.misfit = fit;
+        window.SetPaths(job.source, job.output);
     }
+
+    EConversion Run()
+    {
+        if (!Open() || !SelectProfile() || !MayConvert())
+            return EConversion::Failed;
+        if (m_kOptions.dryRun)
+            return EConversion::Planned;
+        return Convert() && Save() ? EConversion::Converted : EConversion::Failed;
+    }
+
+private:
+    bool Open() { return m_kContent.OpenSource() != 0 && !m_kWindow.HasFailed(); }
+    bool SelectProfile();
+    bool MayConvert();
+    bool Convert();
+    bool Save() { return m_kContent.SaveResult() != 0 && !m_kWindow.HasFailed(); }
+    void TellMisfit();
+    bool RefuseEmpty();
+
+    const COptions& m_kOptions;
+    const CConversionJob& m_kJob;
+    CShellWindow& m_kWindow;
+    Account& m_kAccount;
+    CFilePlatform m_kPlatform;
+    CShellContent m_kContent;
+};
+
+bool CConversion::SelectProfile()
+{
+    CProfileFit best;
+    if (!m_kOptions.profile.empty())
+    {
+        if (!m_kContent.SelectProfile(m_kOptions.profile))
+            return false;
+    }
+    else if (!m_kContent.SelectFittingProfile(best))
+    {
+        m_kWindow.Report(NoneFitsReport(m_kJob.source, best));
+        m_kAccount.misfit = best;
+        return false;
+    }
+    m_kContent.Profile()->GetProfileName(m_kAccount.profile);
+    m_kAccount.profilePath = m_kContent.ProfilePath();
+    return true;
+}
+
+// The state of the window's button is the rule. Source, target and profile are there, so that only keys can
+// lack.
+bool CConversion::MayConvert()
+{
+    return m_kWindow.IsEnabled("convert") || RefuseEmpty();
+}
+
+bool CConversion::RefuseEmpty()
+{
+    m_kWindow.Report(
+        ShellFailure(m_kJob.source, "no-frames", "the motion has no frames; there is nothing to convert"));
     return false;
 }
 
-EConversion Run(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
+bool CConversion::Convert()
 {
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
-    window.SetPaths(job.source, job.output);
-    if (content.OpenSource() == 0 || window.HasFailed() || !SelectProfile(options, job, content, account) ||
-        !MayConvert(window, job))
-        return EConversion::Failed;
-    content.Profile()->GetProfileName(account.profile);
-    account.profilePath = content.ProfilePath();
-    if (options.dryRun)
-        return EConversion::Planned;
-    if (!Convert(job, window, content, account))
-        return EConversion::Failed;
-    content.SaveResult();
-    account.frames = content.ResultMotion().GetKeyCount();
-    return window.HasFailed() ? EConversion::Failed : EConversion::Converted;
+    m_kWindow.PassOverMissingBones();
+    if (m_kContent.ConvertMotion() == 0)
+    {
+        TellMisfit();
+        return false;
+    }
+    if (m_kWindow.HasFailed())
+        return false;
+    m_kAccount.frames = m_kContent.ResultMotion().GetKeyCount();
+    return m_kAccount.frames > 0 || RefuseEmpty(); // a container may say that it ends before it begins
+}
+
+// Where the profile fits, the reason was reported.
+void CConversion::TellMisfit()
+{
+    CProfileFit fit;
+    if (!m_kContent.Measure(m_kContent.ProfilePath(), fit) || fit.IsWhole())
+        return;
+    m_kWindow.Report(MisfitReport(m_kJob.source, fit));
+    m_kAccount.misfit = fit;
+}
+
+EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
+{
+    if (options.skipExisting && IsTaken(job.output))
+        return EConversion::Skipped;
+    const std::optional<CReport> refusal = WhyNotWrite(options, job.output);
+    if (!refusal)
+        return CConversion(options, job, window, account).Run();
+    window.Report(*refusal);
+    return EConversion::Failed;
 }
 
 void Print(const CConversionJob& job, const Account& account)
@@ -118,13 +167,6 @@ void WriteJson(const CConversionJob& job, const Account& account, const CShellWi
     }
     json.EndObject();
     json.EndDocument();
-}
-
-EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
-{
-    if (options.skipExisting && IsTaken(job.output))
-        return EConversion::Skipped;
-    return MayWrite(options, job.output) ? Run(options, job, window, account) : EConversion::Failed;
 }
 
 } // namespace

@@ -1,8 +1,8 @@
 #include "FitWords.h"
 
 #include "CJsonWriter.h"
+#include "CReport.h"
 #include "ProfileFit.h"
-#include "Text.h"
 #include "Words.h"
 
 #include <tuple>
@@ -58,19 +58,18 @@ std::string MissingLines(const CProfileFit& fit)
     return lines;
 }
 
-void SayMisfit(const std::string& source, const CProfileFit& fit)
+CReport MisfitReport(const std::string& source, const CProfileFit& fit)
 {
-    SayError(Printable(source) + ": profile " + Quoted(fit.name) + ": " + FitSummary(fit) + '\n' +
-             MissingLines(fit));
+    return ShellFailure(source, "misfit",
+                        "profile " + Quoted(fit.name) + ": " + FitSummary(fit) + '\n' + MissingLines(fit));
 }
 
-void SayNoneFits(const std::string& source, const CProfileFit& nearest)
+CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest)
 {
-    SayError(Printable(source) + (nearest.rowCount == 0
-                                      ? ": no profile is installed; name one with --profile FILE"
-                                      : ": no installed profile fits; this comes nearest:"));
-    if (nearest.rowCount != 0)
-        SayMisfit(source, nearest);
+    CReport report = MisfitReport(source, nearest);
+    report.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
+                                         : "no installed profile fits; nearest comes " + report.words;
+    return report;
 }
 
 void WriteFit(CJsonWriter& json, const CProfileFit& fit)

@@ -6,6 +6,7 @@ namespace gw {
 
 class CJsonWriter;
 struct CProfileFit;
+struct CReport;
 
 /// Whether a profile fits a source better than another: one of which all rows fit goes before one of which
 /// not, more rows before fewer, and of those that do not fit the one that misses less.
@@ -15,10 +16,10 @@ bool IsBetterFit(const CProfileFit& fit, const CProfileFit& other);
 std::string FitSummary(const CProfileFit& fit);
 /// What a profile misses, one line each, with the nearest names.
 std::string MissingLines(const CProfileFit& fit);
-/// Why a source is not converted by a profile, on standard error, with both.
-void SayMisfit(const std::string& source, const CProfileFit& fit);
-/// Why it is converted by none, with the one that comes nearest; without rows none is installed.
-void SayNoneFits(const std::string& source, const CProfileFit& nearest);
+/// Why a source is not converted by a profile.
+CReport MisfitReport(const std::string& source, const CProfileFit& fit);
+/// Why it is converted by no installed one, with the one that comes nearest; without rows none is installed.
+CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest);
 /// The same as members of a JSON object.
 void WriteFit(CJsonWriter& json, const CProfileFit& fit);
 

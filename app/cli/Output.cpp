@@ -14,15 +14,21 @@ bool IsTaken(const std::string& path)
     return FileExists(path) || FolderExists(path);
 }
 
-bool MayWrite(const COptions& options, const std::string& path)
+std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path)
 {
     if (FolderExists(path))
-        SayError(Printable(path) + ": this is a folder; name the file to write");
-    else if (FileExists(path) && !options.force)
-        SayError(Printable(path) + ": the file exists; --force replaces it");
-    else
-        return true;
-    return false;
+        return ShellFailure(path, "folder", "this is a folder; name the file to write");
+    if (FileExists(path) && !options.force)
+        return ShellFailure(path, "exists", "the file exists; --force replaces it");
+    return std::nullopt;
+}
+
+bool MayWrite(const COptions& options, const std::string& path)
+{
+    const std::optional<CReport> refusal = WhyNotWrite(options, path);
+    if (refusal)
+        SayReport(options, *refusal);
+    return !refusal;
 }
 
 EExit TellWritten(const COptions& options, const std::string& source, const std::string& output)

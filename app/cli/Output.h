@@ -1,14 +1,18 @@
 #pragma once
 
 #include "COptions.h"
+#include "CReport.h"
 
+#include <optional>
 #include <string>
 
 namespace gw {
 
 /// Whether something stands under a path already.
 bool IsTaken(const std::string& path);
-/// Whether a command may write a file: it is not there, or --force stands and it is a file. Says why not.
+/// Why a command may not write a file: it is there without --force, or it is a folder.
+std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path);
+/// Whether a command may write a file. Says why not.
 bool MayWrite(const COptions& options, const std::string& path);
 /// Tells on standard output what was made of what. Answers Done.
 EExit TellWritten(const COptions& options, const std::string& source, const std::string& output);

@@ -31,6 +31,15 @@ void SayReport(const COptions& options, const CReport& report)
         SayError(ReportLine(report));
 }
 
+CReport ShellFailure(const std::string& path, const char* code, const std::string& words)
+{
+    CReport report;
+    report.path = path;
+    report.code = code;
+    report.words = words;
+    return report;
+}
+
 void SayFailure(const std::string& path, const CFailure& failure)
 {
     SayError(ReportLine(MakeReport(path, failure, false)));

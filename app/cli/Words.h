@@ -16,6 +16,8 @@ void SayError(std::string_view words);
 void SayWord(const COptions& options, std::string_view words);
 /// A failure always, a warning unless --quiet.
 void SayReport(const COptions& options, const CReport& report);
+/// A failure that only the shell knows of. The code is a short fixed word for programs.
+CReport ShellFailure(const std::string& path, const char* code, const std::string& words);
 /// The failure that a file's reader or writer kept, in words.
 void SayFailure(const std::string& path, const CFailure& failure);
 /// All warnings that it kept.
