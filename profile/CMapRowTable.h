@@ -3,6 +3,7 @@
 #include "ProfileFile.h"
 
 #include <array>
+#include <deque>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -88,7 +89,7 @@ private:
     static size_t Index(int row) { return static_cast<size_t>(row); }
     bool Has(int row) const { return row >= 0 && row < RowCount(); }
 
-    std::vector<Row> m_kRows;
+    std::deque<Row> m_kRows;       // Remove All takes rows off the front
     std::vector<bool> m_kSelected; // one for each row
 };
 
