@@ -1,0 +1,78 @@
+#pragma once
+
+#include "CControl.h"
+#include "CMaterialBase.h"
+#include "CTriMesh.h"
+#include "CTriMeshUVWMap.h"
+
+#include <algorithm>
+
+namespace gw {
+
+class CTestMaterial : public CMaterial
+{
+public:
+    CTestMaterial() = default;
+    CObject* CreateClone() const override { return new CTestMaterial(*this); }
+};
+
+/// A unit cube of 8 points and 12 triangles; each face has four normals of its own, 24 in all.
+inline Ref<CTriMesh> Cube(int32_t colorCount = 0)
+{
+    Ref<CTriMesh> mesh = new CTriMesh;
+    mesh->SetPointCount(8);
+    mesh->SetNormalCount(24);
+    mesh->SetColorCount(colorCount);
+    mesh->SetTriangleQuantity(12);
+    for (uint32_t i = 0; i < 8; ++i)
+        mesh->XYZBuffer()[i] = {float(i & 1), float(i >> 1 & 1), float(i >> 2)};
+    constexpr uint32_t kQuads[6][4] = {
+        {0, 2, 3, 1},
+        {4, 5, 7, 6},
+        {0, 1, 5, 4},
+        {2, 6, 7, 3},
+        {0, 4, 6, 2},
+        {1, 3, 7, 5}
+    };
+    constexpr uint32_t kCorners[6] = {0, 1, 2, 0, 2, 3};
+    for (uint32_t corner = 0; corner < 36; ++corner)
+    {
+        mesh->XYZTriIndexBuffer()[corner] = kQuads[corner / 6][kCorners[corner % 6]];
+        mesh->NormalTriIndexBuffer()[corner] = corner / 6 * 4 + kCorners[corner % 6];
+    }
+    return mesh;
+}
+
+/// The cube with every block there is, two maps and a hole between them, and no value at its default.
+inline Ref<CTriMesh> FullMesh()
+{
+    Ref<CTriMesh> mesh = Cube(2);
+    mesh->CreateXYZMtl();
+    mesh->CreateTriangleMtlID();
+    mesh->CreateSmoothFlag();
+    mesh->ColorTriIndexBuffer()[5] = 1;
+    mesh->XYZMtl()[3] = 4;
+    mesh->SmoothFlag()[2] = 8;
+    mesh->TriangleMtlID()[11] = 1;
+    mesh->NormalBuffer()[7] = {0, 0, 1};
+    mesh->ColorBuffer()[1] = {1, 0.5f, 0};
+    mesh->m_kAttributeRanges = {
+        AttributeRange{1,  0, 4},
+        AttributeRange{-2, 4, 8}
+    };
+    mesh->m_apkUVWMap.resize(3);
+    for (const size_t slot : {0, 2})
+    {
+        CTriMeshUVWMap* map = new CTriMeshUVWMap;
+        mesh->m_apkUVWMap[slot] = map;
+        map->SetUVWCount(3);
+        map->UVWBuffer()[2] = {0.5f, 0.25f, 0};
+        map->SetTriangleQuantity(12);
+        map->UVWTriIndexBuffer()[30] = 2;
+    }
+    mesh->m_bBoneMesh = true;
+    mesh->BuildVertexTable();
+    return mesh;
+}
+
+} // namespace gw

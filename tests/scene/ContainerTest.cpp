@@ -1,0 +1,517 @@
+#include "CCamera.h"
+#include "CLight.h"
+#include "Packaging.h"
+#include "Paths.h"
+#include "SceneBytes.h"
+#include "SceneSamples.h"
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+
+#include <numeric>
+
+namespace gw {
+
+namespace {
+
+std::vector<std::byte> SampleBytes()
+{
+    COrrinStream stream;
+    stream.AddRoot(SampleGraph().Get());
+    return SaveBytes(stream);
+}
+
+CNode* RootNode(const COrrinStream& stream)
+{
+    return RecordCast<CNode>(stream.GetRoot(0));
+}
+
+} // namespace
+
+TEST(COrrinStream, NoRootsAre79Bytes)
+{
+    const CTempFolder folder;
+    COrrinStream stream;
+    ASSERT_TRUE(stream.SaveFile(folder.Path("empty.orn")));
+    const std::string written = ReadBytes(folder.Path("empty.orn"));
+    EXPECT_EQ(written, CSceneBytes().Header().EmptyThumbnail().View());
+    EXPECT_EQ(written.size(), 79u);
+    COrrinStream again;
+    EXPECT_TRUE(again.LoadFile(folder.Path("empty.orn"), false));
+    EXPECT_FALSE(again.Record().Failure());
+    EXPECT_EQ(again.GetRootCount(), 0u);
+    EXPECT_EQ(again.GetBaseDirectory() + kPathSeparator, folder.Path());
+}
+
+TEST(COrrinStream, WritesWhatTheFormatSays)
+{
+    const Ref<CNode> node = new CNode;
+    node->SetName("n");
+    node->AttachChild(new CPointLight);
+    node->AttachControl(new CKeyframeControl);
+    COrrinStream stream;
+    stream.AddRoot(node.Get());
+    CSceneBytes bytes = Scene().Root().Node(1, {3, 0}, "n", {2, 0, 0}).Track(2, 1, 0);
+    bytes.Object("CPointLight", 3).Spatial().Words({0, 0, 0}).Float(1).Byte(1).Words({0, 0, 0});
+    EXPECT_EQ(SaveBytes(stream), bytes.Bytes());
+}
+
+TEST(PackageMotion, EveryByteIsWhereItBelongs)
+{
+    const struct
+    {
+        const char* what;
+        const char* source;
+        const char* content;
+        uint32_t format;
+    } rows[] = {
+        {"htr in capitals", "walk.HTR",     "abc", 3},
+        {"cha",             "walk.cha",     "x",   1},
+        {"chb",             "walk.chb",     "y",   2},
+        {"another ending",  "walk.htr.bak", "z",   0},
+        {"empty",           "none.htr",     "",    3},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CTempFolder folder;
+        const std::string_view content = row.content;
+        const uint32_t size = static_cast<uint32_t>(content.size());
+        WriteBytes(folder.Path(row.source), content);
+        CFailureRecord record;
+        ASSERT_TRUE(PackageMotion(folder.Path(row.source), folder.Path("out"), 30.0f, 60.0f, record));
+        EXPECT_FALSE(record.Failure());
+
+        CSceneBytes bytes;
+        bytes.Header().EmptyThumbnail().Root().Node(1).Root();
+        bytes.Object("CRawData", 2, "MotionInfo").Text("It's me 3").Words({300, 0, 3, 16, 1});
+        bytes.Words({1, row.format}).Float(30).Float(60);
+        bytes.Object("CRawData", 3, "MotionFile").Text("It's me 3").Words({300, 0, 0, size});
+        bytes.Word(size ? 1 : 0).Raw(content);
+        EXPECT_EQ(bytes.Bytes().size(), 381 + content.size());
+        EXPECT_EQ(ReadBytes(folder.Path("out")), bytes.View());
+    }
+}
+
+TEST(PackageMotion, ASourceThatIsNotThereIsRefusedAndATargetThatCannotBeIsTold)
+{
+    const CTempFolder folder;
+    CFailureRecord record;
+    EXPECT_FALSE(PackageMotion(folder.Path("none.htr"), folder.Path("out"), 30, 60, record));
+    EXPECT_EQ(record.Failure().reason, EFailure::NotFound);
+    EXPECT_FALSE(FileExists(folder.Path("out")));
+    record.Clear();
+    WriteBytes(folder.Path("a.htr"), {});
+    EXPECT_TRUE(PackageMotion(folder.Path("a.htr"), folder.Path("no/such/folder"), 30, 60, record));
+    EXPECT_EQ(record.Failure().reason, EFailure::WriteError);
+}
+
+TEST(COrrinStream, HeadersAreRefusedByTheirRules)
+{
+    const struct
+    {
+        const char* text; // 20 characters and what follows
+        EFailure reason;
+    } rows[] = {
+        {"TKOrrin Version 1.20",  EFailure::None      },
+        {"TKOrrin Version 0.01",  EFailure::None      },
+        {"TKOrrin Version 1. 2",  EFailure::None      },
+        {"TKOrrin Version 1.1x",  EFailure::None      },
+        {"TKOrrin Version 1.21",  EFailure::BadVersion},
+        {"TKOrrin Version 0.00",  EFailure::BadVersion},
+        {"TKOrrin Version 1,20",  EFailure::BadHeader },
+        {"TKOrrin Version 12.0",  EFailure::BadHeader },
+        {"TKOrrin version 1.20",  EFailure::BadHeader },
+        {"TKOrrin Version 1.200", EFailure::BadHeader },
+    };
+    const CTempFolder folder;
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.text);
+        CSceneBytes bytes;
+        bytes.Raw(row.text).Byte(0).EmptyThumbnail();
+        WriteBytes(folder.Path("a.orn"), bytes.View());
+        COrrinStream stream;
+        stream.AddRoot(new CNode); // stays when the file is refused
+        EXPECT_EQ(stream.LoadFile(folder.Path("a.orn"), false), row.reason == EFailure::None);
+        EXPECT_EQ(stream.Record().Failure().reason, row.reason);
+        EXPECT_EQ(stream.GetRootCount(), row.reason == EFailure::None ? 0u : 1u);
+    }
+    for (const size_t size : {0u, 1u, 19u, 20u})
+    {
+        WriteBytes(folder.Path("a.orn"), std::string_view("TKOrrin Version 1.20").substr(0, size));
+        COrrinStream stream;
+        EXPECT_FALSE(stream.LoadFile(folder.Path("a.orn"), false)) << size;
+    }
+    COrrinStream stream;
+    EXPECT_FALSE(stream.LoadFile(folder.Path("none.orn"), false));
+    EXPECT_FALSE(stream.LoadFile(folder.Path(), false)) << "a folder";
+}
+
+TEST(COrrinStream, OldVersionsHaveOneChainHeadAndNewerOnesThree)
+{
+    const CTempFolder folder;
+    for (const char* version : {"0.01", "1.00", "1.01", "1.20"})
+    {
+        SCOPED_TRACE(version);
+        const bool three = std::string_view(version) > "1.00";
+        CSceneBytes bytes;
+        bytes.Header(version).EmptyThumbnail().Root().Text("CNode").Word(9).Text("old");
+        three ? bytes.Words({7, 0, 8}) : bytes.Word(7);
+        bytes.Spatial().Word(1).Byte(1).Byte(1).Word(0);
+        bytes.Text("CKeyframeControl").Word(7).Text("");
+        three ? bytes.Words({0, 0, 0}) : bytes.Word(0);
+        bytes.Word(0).Float(0).Float(0).Float(0).Float(1).Byte(1).Words({9, 0});
+        bytes.Add(kMat4Identity).Byte(0).Words({0, 0, 0, 0, 0, 0, 0, 0});
+        if (three)
+            bytes.RawData(8, 0);
+        WriteBytes(folder.Path("old.orn"), bytes.View());
+
+        COrrinStream stream;
+        ASSERT_TRUE(stream.LoadFile(folder.Path("old.orn"), false));
+        EXPECT_FALSE(stream.Record().Failure());
+        CNode* node = RootNode(stream);
+        ASSERT_NE(node, nullptr);
+        ASSERT_NE(node->GetControl(), nullptr);
+        EXPECT_EQ(node->GetControl()->GetTarget(), node);
+        EXPECT_EQ(node->GetCustomData() != nullptr, three);
+        EXPECT_TRUE(SurvivesRewriting(stream));
+    }
+}
+
+TEST(COrrinStream, EveryClassComesBackAsItWas)
+{
+    COrrinStream stream;
+    stream.AddRoot(SampleGraph().Get());
+    EXPECT_TRUE(SurvivesRewriting(stream));
+    COrrinStream again;
+    ASSERT_TRUE(LoadBytes(again, SaveBytes(stream)));
+    CNode* root = RootNode(again);
+    EXPECT_EQ(root->GetCustomData(), root->ChildAt(2)->GetCustomData()) << "shared stays shared";
+    EXPECT_EQ(root->GetCustomData()->GetRefCount(), 2u);
+    EXPECT_EQ(root->ChildAt(2)->GetControl()->GetTarget(), root);
+    EXPECT_EQ(root->ChildAt(1), nullptr) << "slots stay in place";
+    EXPECT_NE(root->ChildAt(3), nullptr);
+    EXPECT_EQ(SaveBytes(again), SaveBytes(stream));
+}
+
+TEST(COrrinStream, SizesAreThoseOfTheFormat)
+{
+    const struct
+    {
+        Ref<CObject> object;
+        uint64_t disk;
+        uint64_t memory; // 0 where no figure is fixed
+    } rows[] = {
+        {new CNode,                108, 212},
+        {new CBillboardNode,       117, 212},
+        {new CCamera,              170, 284},
+        {new CCameraTarget,        106, 188},
+        {new CPointLight,          133, 236},
+        {new CRawData,             56,  56 },
+        {new CAuthorInfo,          71,  68 },
+        {new CKeyframeClipControl, 178, 0  },
+        {new CKeyframeControl,     166, 0  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.object->GetRTTI()->m_pcName);
+        EXPECT_EQ(row.object->GetDiskUsed(), row.disk);
+        EXPECT_TRUE(!row.memory || row.object->GetMemoryUsed() == row.memory);
+        row.object->SetName("four");
+        EXPECT_EQ(row.object->GetDiskUsed(), row.disk + 4);
+        COrrinStream stream;
+        stream.AddRoot(row.object.Get());
+        EXPECT_EQ(SaveBytes(stream).size(), 58 + 14 + row.disk + 4);
+    }
+    COrrinStream stream;
+    stream.AddRoot(SampleGraph().Get());
+    uint64_t bytes = 58 + 14;
+    for (const CObject* object : stream.ObjectsInSaveOrder())
+        bytes += object->GetDiskUsed();
+    EXPECT_EQ(SaveBytes(stream).size(), bytes);
+}
+
+TEST(COrrinStream, RootsAreListedOnceAndWrittenAtTheirPlaceInTheWalk)
+{
+    const Ref<CNode> outer = new CNode;
+    const Ref<CNode> inner = new CNode;
+    outer->AttachChild(inner.Get());
+    COrrinStream stream;
+    EXPECT_FALSE(stream.AddRoot(nullptr));
+    EXPECT_TRUE(stream.AddRoot(outer.Get()));
+    EXPECT_TRUE(stream.AddRoot(inner.Get()));
+    EXPECT_FALSE(stream.AddRoot(outer.Get()));
+    EXPECT_EQ(stream.GetRoot(2), nullptr);
+    EXPECT_EQ(inner->GetRefCount(), 3u);
+    EXPECT_EQ(SaveBytes(stream), Scene().Root().Node(1, {2, 0}).Root().Node(2).Bytes());
+    stream.RemoveAllRoots();
+    EXPECT_FALSE(stream.IsRoot(outer.Get()));
+    EXPECT_EQ(outer->GetRefCount(), 1u);
+}
+
+TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
+{
+    CSceneBytes bytes;
+    bytes.Text("any tag").Words({2, 2, 1}).Add<uint16_t>(1).Words({72, 73, 0xdead});
+    bytes.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8); // 6 bytes a row, rounded up to 8
+    bytes.Root().Node(1, {}, std::string_view("cut\0off", 7));
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
+    EXPECT_EQ(RootNode(stream)->NameView(), "cut");
+    EXPECT_EQ(stream.Thumbnail().m_kPixels.size(), 16u);
+    CSceneBytes written;
+    written.Text("_OrrinThumbnail").Words({2, 2, 1}).Add<uint16_t>(1).Words({72, 73, 1});
+    written.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8).Root().Node(1, {}, "cut");
+    EXPECT_EQ(SaveBytes(stream), written.Bytes());
+
+    const struct
+    {
+        const char* what;
+        uint32_t width, height, format, presence;
+        bool whole;
+    } rows[] = {
+        {"a size without pixels", 10,         10,    0, 0, true },
+        {"no width",              0,          9,     0, 1, true },
+        {"no height",             9,          0,     0, 1, true },
+        {"no such format",        1,          1,     6, 1, false},
+        {"below 0",               0xffffffff, 1,     0, 1, false},
+        {"more than there is",    99,         99,    5, 1, false},
+        {"a product of 34 bits",  65536,      65536, 0, 1, false},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CSceneBytes odd;
+        odd.Text("").Words({row.width, row.height, row.format});
+        odd.Add<uint16_t>(0).Words({96, 96, row.presence, 1, 0}).Byte(0).Word(0).Root().Node(1);
+        COrrinStream loaded;
+        EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), row.whole);
+        EXPECT_EQ(loaded.GetRootCount(), row.whole ? 1u : 0u);
+        EXPECT_TRUE(loaded.Thumbnail().m_kPixels.empty());
+    }
+}
+
+TEST(DamagedContainer, EveryPrefixIsReadUpToItsLastWholeRecord)
+{
+    const std::vector<std::byte> whole = SampleBytes();
+    const uint32_t before = g_uiObjectCount;
+    for (size_t size = 0; size < whole.size(); ++size)
+    {
+        COrrinStream stream;
+        const bool loaded = LoadBytes(stream, std::span(whole).first(size));
+        ASSERT_EQ(loaded, !stream.Record().Failure()) << size;
+        ASSERT_LE(stream.Record().Failure().where, size);
+        ASSERT_TRUE(SurvivesRewriting(stream)) << size;
+    }
+    EXPECT_EQ(g_uiObjectCount, before);
+}
+
+TEST(DamagedContainer, AnyWordMayBeAnything)
+{
+    const std::vector<std::byte> whole = SampleBytes();
+    const uint32_t before = g_uiObjectCount;
+    for (const uint32_t word : {0xffffffffu, 0x80000000u, 0x15555556u, 1u})
+    {
+        for (size_t at = 0; at + 4 <= whole.size(); ++at)
+        {
+            std::vector<std::byte> bytes = whole;
+            std::memcpy(bytes.data() + at, &word, 4);
+            COrrinStream stream;
+            stream.LoadBuffer(bytes, 0);
+            for (size_t root = 0; root < stream.GetRootCount(); ++root)
+                stream.GetRoot(root)->Update(1.0f);
+            ASSERT_TRUE(SurvivesRewriting(stream)) << word << " at " << at;
+        }
+    }
+    EXPECT_EQ(g_uiObjectCount, before);
+}
+
+TEST(DamagedContainer, ReadingStopsAtWhatCannotBeMade)
+{
+    for (const char* name : {"CBoneMesh", "CSpatial", "CObject", "cnode", "CNode ", ""})
+    {
+        SCOPED_TRACE(name);
+        CSceneBytes bytes = Scene().Root().Node(1, {2}).Node(2);
+        const size_t end = bytes.Bytes().size();
+        bytes.Object(name, 3).Root().Node(4);
+        COrrinStream stream;
+        EXPECT_FALSE(LoadBytes(stream, bytes.Bytes()));
+        EXPECT_EQ(stream.Record().Failure().reason, EFailure::UnknownClass);
+        EXPECT_EQ(stream.Record().Failure().where, end);
+        EXPECT_EQ(stream.Record().Failure().name, name);
+        ASSERT_EQ(stream.GetRootCount(), 1u);
+        EXPECT_EQ(RootNode(stream)->ChildAt(0), nullptr) << "the roots read so far stay unlinked";
+    }
+}
+
+TEST(Links, OfAWrongClassOrOfNothingAreNull)
+{
+    CSceneBytes bytes = Scene();
+    bytes.Root().Node(1, {6, 77, 0, 4}, "", {4, 4, 4}); // children: raw data, nothing, null, node
+    bytes.Node(4, {}, "first");
+    bytes.Root().Node(4, {6}, "second of the id");
+    bytes.Root().Node(0, {4}, "without id");
+    bytes.Track(5, 6, 4);
+    bytes.RawData(6, 5);
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
+    CNode* node = RootNode(stream);
+    EXPECT_EQ(node->GetControl(), nullptr);
+    EXPECT_EQ(node->GetCustomData(), nullptr);
+    ASSERT_NE(node->GetModifier(), nullptr) << "any object may head the modifiers";
+    EXPECT_EQ(node->GetModifier()->NameView(), "first");
+    EXPECT_EQ(node->ChildAt(0), nullptr);
+    EXPECT_EQ(node->ChildAt(1), nullptr);
+    EXPECT_EQ(node->ChildAt(3)->NameView(), "first");
+    EXPECT_EQ(stream.GetRoot(1)->NameView(), "second of the id");
+    EXPECT_TRUE(stream.GetRoot(1)->HeldObjects().empty()) << "stays unlinked";
+    EXPECT_EQ(stream.GetRoot(2)->NameView(), "without id");
+    EXPECT_TRUE(SurvivesRewriting(stream));
+}
+
+TEST(Links, CustomDataStandsByItsTypeAndNotByItsRecord)
+{
+    CSceneBytes bytes = Scene().Root().RawData(1, 2);
+    bytes.Object("CAuthorInfo", 2).Text("").Words({0, 0, 0, 0, 0, 0, 0, 0});
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
+    EXPECT_NE(static_cast<CRawData*>(stream.GetRoot(0))->GetNextData(), nullptr);
+}
+
+TEST(Links, APlainPointerToWhatNobodyHoldsIsNull)
+{
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, Scene().Root().Node(1, {}, "", {2, 0, 0}).Track(2, 3, 0).Node(3).Bytes()));
+    ASSERT_NE(RootNode(stream)->GetControl(), nullptr);
+    EXPECT_EQ(RootNode(stream)->GetControl()->GetTarget(), nullptr);
+    EXPECT_FALSE(RootNode(stream)->GetControl()->UpdateTransform(1.0f));
+}
+
+TEST(Links, RingsAreRefusedAndFreed)
+{
+    const auto expectCycle = [](const char* what, const CSceneBytes& bytes) {
+        SCOPED_TRACE(what);
+        const uint32_t before = g_uiObjectCount;
+        COrrinStream stream;
+        EXPECT_FALSE(LoadBytes(stream, bytes.Bytes()));
+        EXPECT_EQ(stream.Record().Failure().reason, EFailure::Cycle);
+        EXPECT_EQ(stream.GetRootCount(), 0u);
+        EXPECT_EQ(g_uiObjectCount, before);
+    };
+    expectCycle("own child", Scene().Root().Node(1, {1}));
+    expectCycle("among its descendants", Scene().Root().Node(1, {2}).Node(2, {3}).Node(3, {2}));
+    expectCycle("control chain", Scene().Root().Node(1, {}, "", {2, 0, 0}).Track(2, 1, 3).Track(3, 1, 2));
+    expectCycle("custom data chain", Scene().Root().RawData(1, 2).RawData(2, 1));
+    expectCycle("out of reach of any root", Scene().Root().Node(1).RawData(2, 2));
+    COrrinStream stream;
+    const CSceneBytes upward = Scene().Root().Node(1, {2}).Node(2, {}, "", {3, 0, 0}).Track(3, 1, 0);
+    EXPECT_TRUE(LoadBytes(stream, upward.Bytes())) << "a target is no count";
+}
+
+namespace {
+
+// A root with as many levels as told, itself included. Written leaf first, so that ids do not follow the
+// nesting.
+std::vector<std::byte> NestedNodes(uint32_t levels)
+{
+    CSceneBytes bytes = Scene();
+    for (uint32_t level = levels; level > 0; --level)
+    {
+        if (level == 1)
+            bytes.Root();
+        level == levels ? bytes.Node(level) : bytes.Node(level, {level + 1});
+    }
+    return bytes.Bytes();
+}
+
+} // namespace
+
+TEST(Nesting, UpToTheLimitEveryWalkStandsAndBeyondItIsRefused)
+{
+    const uint32_t before = g_uiObjectCount;
+    {
+        COrrinStream stream;
+        ASSERT_TRUE(LoadBytes(stream, NestedNodes(kNestingLimit)));
+        CNode* root = RootNode(stream);
+        root->m_kMatrix.SetTranslation({1, 0, 0});
+        root->UpdateScene(0.0f, true);
+        root->PushAndApply(nullptr);
+        std::vector<CObject*> found;
+        root->FindObjects(found, nullptr, &CNode::ms_kRTTI, false);
+        EXPECT_EQ(found.size(), kNestingLimit);
+        EXPECT_EQ(static_cast<CNode*>(found.back())->m_kWorldMatrix, root->m_kWorldMatrix);
+        root->Bind(*root);
+        CCloneMap map;
+        const Ref<CObject> clone = root->Clone(map);
+        const Ref<CNode> skeleton = root->CopySkeleton();
+        EXPECT_EQ(map.size(), kNestingLimit);
+        EXPECT_TRUE(SurvivesRewriting(stream));
+    }
+    for (const size_t levels : {kNestingLimit + 1, size_t{100'000}})
+    {
+        COrrinStream stream;
+        EXPECT_FALSE(LoadBytes(stream, NestedNodes(static_cast<uint32_t>(levels))));
+        EXPECT_EQ(stream.Record().Failure().reason, EFailure::TooDeep);
+        EXPECT_EQ(stream.GetRootCount(), 0u);
+    }
+    EXPECT_EQ(g_uiObjectCount, before);
+}
+
+TEST(Nesting, LongChainsCountLikeChildren)
+{
+    CSceneBytes controls = Scene().Root().Node(1, {}, "", {2, 0, 0});
+    CSceneBytes data = Scene().Root();
+    for (uint32_t id = 2; id < 50'000; ++id)
+    {
+        controls.Track(id, 1, id + 1);
+        data.RawData(id, id + 1);
+    }
+    for (const CSceneBytes* bytes : {&controls, &data})
+    {
+        COrrinStream stream;
+        EXPECT_FALSE(LoadBytes(stream, bytes->Bytes()));
+        EXPECT_EQ(stream.Record().Failure().reason, EFailure::TooDeep);
+    }
+}
+
+TEST(Nesting, SharedNodesAreLegalUntilTheirPlacesExplode)
+{
+    // Each level holds the next one twice: as many visits as two to the power of the levels.
+    const auto lattice = [](uint32_t levels) {
+        CSceneBytes bytes = Scene().Root();
+        for (uint32_t level = 1; level < levels; ++level)
+            bytes.Node(level, {level + 1, level + 1});
+        return bytes.Node(levels).Bytes();
+    };
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, lattice(10)));
+    std::vector<CObject*> found;
+    stream.GetRoot(0)->FindObjects(found, nullptr, nullptr, false);
+    EXPECT_EQ(found.size(), 1023u) << "once per place";
+    EXPECT_EQ(stream.ObjectsInSaveOrder().size(), 10u);
+    EXPECT_TRUE(SurvivesRewriting(stream));
+    EXPECT_FALSE(LoadBytes(stream, lattice(64)));
+    EXPECT_EQ(stream.Record().Failure().reason, EFailure::TooLarge);
+}
+
+TEST(COrrinStream, AHundredThousandFlatNodesLoadAndSave)
+{
+    std::vector<uint32_t> ids(100'000);
+    std::iota(ids.begin(), ids.end(), 2);
+    CSceneBytes children = Scene().Root().Node(1, ids);
+    CSceneBytes roots = Scene().Root().Node(1);
+    for (const uint32_t id : ids)
+    {
+        children.Node(id);
+        roots.Root().Node(id);
+    }
+    for (const CSceneBytes* bytes : {&children, &roots})
+    {
+        COrrinStream stream;
+        ASSERT_TRUE(LoadBytes(stream, bytes->Bytes()));
+        EXPECT_EQ(SaveBytes(stream), bytes->Bytes());
+    }
+}
+
+} // namespace gw

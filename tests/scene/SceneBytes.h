@@ -1,0 +1,194 @@
+#pragma once
+
+#include "CFieldArchive.h"
+#include "COrrinStream.h"
+
+#include <algorithm>
+#include <cstring>
+#include <span>
+#include <sstream>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+/// Container bytes put together by hand, value by value, so that tests do not take the writer's word for the
+/// format.
+class CSceneBytes
+{
+public:
+    template <class T>
+    CSceneBytes& Add(const T& value)
+    {
+        const auto bytes = std::as_bytes(std::span(&value, 1));
+        m_kBytes.insert(m_kBytes.end(), bytes.begin(), bytes.end());
+        return *this;
+    }
+    CSceneBytes& Word(uint32_t value) { return Add(value); }
+    CSceneBytes& Words(std::initializer_list<uint32_t> values)
+    {
+        for (const uint32_t value : values)
+            Add(value);
+        return *this;
+    }
+    CSceneBytes& Byte(uint8_t value) { return Add(value); }
+    CSceneBytes& Float(float value) { return Add(value); }
+    CSceneBytes& Raw(std::string_view text)
+    {
+        const auto bytes = std::as_bytes(std::span(text));
+        m_kBytes.insert(m_kBytes.end(), bytes.begin(), bytes.end());
+        return *this;
+    }
+    CSceneBytes& Text(std::string_view text) { return Word(static_cast<uint32_t>(text.size())).Raw(text); }
+
+    /// The 21 bytes at the head of a file.
+    CSceneBytes& Header(std::string_view version = "1.20")
+    {
+        return Raw("TKOrrin Version ").Raw(version).Byte(0);
+    }
+    /// Tag and block of an empty thumbnail, 58 bytes.
+    CSceneBytes& EmptyThumbnail()
+    {
+        Text("_OrrinThumbnail").Words({0, 0, 0}).Add<uint16_t>(0).Words({96, 96, 0});
+        return Words({1, 0}).Byte(0).Word(0);
+    }
+    CSceneBytes& Root() { return Text("_OrrinRoot"); }
+    /// What every record begins with: class, link id, name, heads of the chains.
+    CSceneBytes& Object(std::string_view className, uint32_t id, std::string_view name = {},
+                        std::initializer_list<uint32_t> heads = {0, 0, 0})
+    {
+        return Text(className).Word(id).Text(name).Words(heads);
+    }
+    /// What every spatial adds: the identity, the flag, no render states.
+    CSceneBytes& Spatial() { return Add(kMat4Identity).Byte(1).Word(0); }
+    CSceneBytes& Node(uint32_t id, std::span<const uint32_t> children, std::string_view name = {},
+                      std::initializer_list<uint32_t> heads = {0, 0, 0})
+    {
+        Object("CNode", id, name, heads).Spatial().Word(1).Byte(1).Byte(1);
+        Word(static_cast<uint32_t>(children.size()));
+        for (const uint32_t child : children)
+            Word(child);
+        return *this;
+    }
+    CSceneBytes& Node(uint32_t id, std::initializer_list<uint32_t> children = {}, std::string_view name = {},
+                      std::initializer_list<uint32_t> heads = {0, 0, 0})
+    {
+        return Node(id, std::span(children.begin(), children.size()), name, heads);
+    }
+    /// A track without keys.
+    CSceneBytes& Track(uint32_t id, uint32_t target, uint32_t next)
+    {
+        Object("CKeyframeControl", id).Word(0).Float(0).Float(0).Float(0).Float(1).Byte(1);
+        return Words({target, next}).Add(kMat4Identity).Byte(0).Words({0, 0, 0, 0, 0, 0, 0, 0});
+    }
+    CSceneBytes& RawData(uint32_t id, uint32_t next)
+    {
+        return Object("CRawData", id).Text("").Words({0, 0, next, 0, 0});
+    }
+
+    const std::vector<std::byte>& Bytes() const { return m_kBytes; }
+    std::string_view View() const
+    {
+        return {reinterpret_cast<const char*>(m_kBytes.data()), m_kBytes.size()};
+    }
+
+private:
+    std::vector<std::byte> m_kBytes;
+};
+
+/// The bytes of an object part, records to follow.
+inline CSceneBytes Scene()
+{
+    return CSceneBytes().EmptyThumbnail();
+}
+
+/// A description of fields, one a line: values as bytes in hexadecimal, links as places in the save order.
+class CFieldDescriber : public CFieldArchive
+{
+public:
+    explicit CFieldDescriber(const std::vector<CObject*>& objects)
+        : CFieldArchive(false, kNewestVersion), m_kObjects(objects)
+    {
+    }
+
+    void Text(const char* name, CText& text) override { Line(name) << text.View() << '\n'; }
+    bool Presence(const char* name, bool present) override
+    {
+        Line(name) << present << '\n';
+        return present;
+    }
+    size_t Count(const char* name, size_t count, size_t) override
+    {
+        Line(name) << count << '\n';
+        return count;
+    }
+    std::string Result() const { return m_kText.str(); }
+
+protected:
+    void Values(const char* name, EFieldKind kind, void* values, size_t count) override
+    {
+        Line(name) << std::hex;
+        const auto* bytes = static_cast<const unsigned char*>(values);
+        for (size_t i = 0; i < count * FieldBytes(kind); ++i)
+            m_kText << static_cast<int>(bytes[i]) << ' ';
+        m_kText << std::dec << '\n';
+    }
+    void Slot(const char* name, const CLinkSlot& slot) override
+    {
+        const auto place = std::ranges::find(m_kObjects, slot.Get());
+        Line(name) << "-> " << (place == m_kObjects.end() ? 0 : place - m_kObjects.begin() + 1) << '\n';
+    }
+
+private:
+    std::ostream& Line(const char* name) { return m_kText << "  " << name << ": "; }
+
+    const std::vector<CObject*>& m_kObjects;
+    std::ostringstream m_kText;
+};
+
+/// All that a file of the stream's roots would say, apart from ids: equal texts are equal graphs.
+inline std::string Describe(COrrinStream& stream)
+{
+    const std::vector<CObject*> objects = stream.ObjectsInSaveOrder();
+    std::string text;
+    for (CObject* object : objects)
+    {
+        CFieldDescriber describer(objects);
+        object->Fields(describer);
+        text += std::string(stream.IsRoot(object) ? "root " : "") + object->GetRTTI()->m_pcName + '\n' +
+                describer.Result();
+    }
+    return text;
+}
+
+inline std::string DescribeRoot(CObject* root)
+{
+    COrrinStream stream;
+    stream.AddRoot(root);
+    return Describe(stream);
+}
+
+/// Loads an object part without header, in a block of its own so that one byte too many is seen.
+inline bool LoadBytes(COrrinStream& stream, std::span<const std::byte> bytes)
+{
+    const std::vector<std::byte> block(bytes.begin(), bytes.end());
+    return stream.LoadBuffer(block, 0);
+}
+
+inline std::vector<std::byte> SaveBytes(COrrinStream& stream)
+{
+    std::vector<std::byte> bytes;
+    stream.SaveBuffer(bytes);
+    return bytes;
+}
+
+/// What could be read must survive being written and read again.
+inline bool SurvivesRewriting(COrrinStream& stream)
+{
+    const std::string before = Describe(stream);
+    COrrinStream again;
+    return LoadBytes(again, SaveBytes(stream)) && Describe(again) == before;
+}
+
+} // namespace gw

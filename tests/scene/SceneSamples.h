@@ -1,0 +1,67 @@
+#pragma once
+
+#include "CControl.h"
+#include "CCustomData.h"
+#include "CKeyframeClipControl.h"
+#include "CNode.h"
+#include "CRenderState.h"
+
+#include <vector>
+
+namespace gw {
+
+/// A control that answers as it is told, and counts.
+class CTestControl : public CControl
+{
+public:
+    explicit CTestControl(bool answer = true) : m_bAnswer(answer) {}
+    CObject* CreateClone() const override { return new CTestControl(*this); }
+    bool Update(float time) override
+    {
+        m_kUpdates.push_back(time);
+        return m_bAnswer;
+    }
+    bool UpdateTransform(float) override
+    {
+        ++m_iTransforms;
+        return m_bAnswer;
+    }
+
+    bool m_bAnswer;
+    int m_iTransforms = 0;
+    std::vector<float> m_kUpdates;
+};
+
+class CTestModifier : public CModifier
+{
+public:
+    CObject* CreateClone() const override { return new CTestModifier(*this); }
+    bool Update(float) override
+    {
+        ++m_iUpdates;
+        return true;
+    }
+    bool UpdateTransform(float) override { return true; }
+
+    int m_iUpdates = 0;
+};
+
+class CTestState : public CRenderState
+{
+public:
+    explicit CTestState(size_t type) : m_uiType(type) {}
+    CObject* CreateClone() const override { return new CTestState(*this); }
+    size_t GetType() const override { return m_uiType; }
+
+private:
+    size_t m_uiType;
+};
+
+/// A graph with one object of each class of the room and no value at its default, two tracks that share
+/// nothing, a custom data object that two nodes share, an empty slot, and a target that is not the holder.
+Ref<CNode> SampleGraph();
+
+/// A node with a track whose keys stand at the given times, with positions (time, 0, 0).
+Ref<CNode> TrackedNode(const std::vector<float>& times);
+
+} // namespace gw
