@@ -1,0 +1,342 @@
+#include "CMappedFile.h"
+#include "CSafeFile.h"
+#include "Paths.h"
+#include "TempFolder.h"
+
+#include <algorithm>
+#include <csignal>
+#include <filesystem>
+#include <gtest/gtest.h>
+#include <numeric>
+#include <sys/resource.h>
+#include <sys/stat.h>
+
+namespace gw {
+
+namespace {
+
+namespace fs = std::filesystem;
+
+unsigned ModeOf(const std::string& path)
+{
+    struct stat status = {};
+    EXPECT_EQ(stat(path.c_str(), &status), 0) << path;
+    return status.st_mode & 07777;
+}
+
+bool Save(const std::string& path, std::string_view text)
+{
+    CSafeFile file;
+    return file.Open(path) && file.Write(text) && file.Commit();
+}
+
+size_t EntryCount(const CTempFolder& folder)
+{
+    return static_cast<size_t>(
+        std::distance(fs::directory_iterator(folder.Path()), fs::directory_iterator()));
+}
+
+// A file system that takes no more than so many bytes a file.
+class CFullDisk
+{
+public:
+    explicit CFullDisk(rlim_t byteCount)
+    {
+        std::signal(SIGXFSZ, SIG_IGN);
+        getrlimit(RLIMIT_FSIZE, &m_kOld);
+        const rlimit limit{byteCount, m_kOld.rlim_max};
+        setrlimit(RLIMIT_FSIZE, &limit);
+    }
+    ~CFullDisk()
+    {
+        setrlimit(RLIMIT_FSIZE, &m_kOld);
+        std::signal(SIGXFSZ, SIG_DFL);
+    }
+    CFullDisk(const CFullDisk&) = delete;
+    CFullDisk& operator=(const CFullDisk&) = delete;
+
+private:
+    rlimit m_kOld{};
+};
+
+} // namespace
+
+TEST(Paths, SplitIntoFolderStemAndExtension)
+{
+    const struct
+    {
+        const char* path;
+        const char* folder;
+        const char* stem;
+        const char* extension;
+    } rows[] = {
+        {"/a.b/walk.cut.bvh", "/a.b/",    "walk.cut", ".bvh"},
+        {"C:\\in\\walk.BVH",  "C:\\in\\", "walk",     ".BVH"},
+        {"a/b\\walk",         "a/b\\",    "walk",     ""    },
+        {"walk.",             "",         "walk",     "."   },
+        {".bvh",              "",         "",         ".bvh"},
+        {"a.b/",              "a.b/",     "",         ""    },
+        {"",                  "",         "",         ""    },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.path);
+        const CPathParts parts = SplitPath(row.path);
+        EXPECT_EQ(parts.folder, row.folder);
+        EXPECT_EQ(parts.stem, row.stem);
+        EXPECT_EQ(parts.extension, row.extension);
+    }
+    EXPECT_TRUE(HasExtension("x.y/walk.BVH", ".bvh"));
+    EXPECT_EQ(WithSeparator(""), "");
+    EXPECT_EQ(WithSeparator("a\\"), "a\\");
+}
+
+TEST(Paths, WhatIsThereIsToldApart)
+{
+    const CTempFolder folder;
+    const std::string file = folder.Path("Läufer 走る.bvh");
+    WriteBytes(file, "12345");
+    const std::string endless(300, 'x');
+    const struct
+    {
+        const char* what;
+        std::string path;
+        bool isFile, isFolder, hasSize;
+    } rows[] = {
+        {"file",          file,                true,  false, true },
+        {"folder",        folder.Path(),       false, true,  false},
+        {"device",        "/dev/null",         true,  false, false},
+        {"nothing",       folder.Path("none"), false, false, false},
+        {"inside a file", file + "/x",         false, false, false},
+        {"name too long", endless,             false, false, false},
+        {"no name",       "",                  false, false, false},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        uint64_t size = 99;
+        EXPECT_EQ(FileExists(row.path), row.isFile);
+        EXPECT_EQ(FolderExists(row.path), row.isFolder);
+        EXPECT_EQ(FileSize(row.path, size), row.hasSize);
+        EXPECT_EQ(size, row.hasSize ? 5u : 99u);
+        EXPECT_FALSE(IsReadOnly(row.path));
+    }
+    // Also for root, who may write it all the same.
+    fs::permissions(file, fs::perms::owner_read | fs::perms::group_read);
+    EXPECT_TRUE(IsReadOnly(file));
+    EXPECT_FALSE(DeleteFile(folder.Path()));
+    EXPECT_TRUE(DeleteFile(file));
+    EXPECT_FALSE(DeleteFile(file));
+}
+
+TEST(Paths, FoldersAreMadeWithAllAboveThem)
+{
+    const CTempFolder folder;
+    EXPECT_TRUE(CreateFolder(folder.Path("a/b/c")));
+    EXPECT_TRUE(CreateFolder(folder.Path("a/b/d/")));
+    EXPECT_TRUE(CreateFolder(folder.Path("a/b")));
+    WriteBytes(folder.Path("a/file"), "");
+    EXPECT_FALSE(CreateFolder(folder.Path("a/file")));
+    EXPECT_FALSE(CreateFolder(folder.Path("a/file/b")));
+    EXPECT_TRUE(FolderExists(folder.Path("a/b/d")));
+}
+
+TEST(Paths, FilesOfAFolderComeInNameOrder)
+{
+    const CTempFolder folder;
+    for (const char* name : {"c.prf", "a.PRF", "b.prf", "b.prf.bak", "prf", "Z.prf"})
+        WriteBytes(folder.Path(name), "");
+    CreateFolder(folder.Path("folder.prf"));
+    fs::create_symlink("nowhere", folder.Path("dangling.prf"));
+    EXPECT_EQ(FilesInFolder(folder.Path(), ".prf"),
+              (std::vector<std::string>{"Z.prf", "a.PRF", "b.prf", "c.prf"}));
+    EXPECT_TRUE(FilesInFolder(folder.Path("none"), ".prf").empty());
+}
+
+TEST(Paths, TheProgramLiesInItsFolder)
+{
+    EXPECT_TRUE(FileExists(ExecutableFolder() + fs::read_symlink("/proc/self/exe").filename().string()));
+}
+
+TEST(CMappedFile, MapsRegularFilesOnly)
+{
+    const CTempFolder folder;
+    WriteBytes(folder.Path("full"), "HIERARCHY");
+    WriteBytes(folder.Path("empty"), "");
+    ASSERT_EQ(mkfifo(folder.Path("pipe").c_str(), 0600), 0);
+    const struct
+    {
+        const char* what;
+        std::string path;
+        EFailure failure;
+        const char* text;
+    } rows[] = {
+        {"file",             folder.Path("full"),  EFailure::None,       "HIERARCHY"},
+        {"empty file",       folder.Path("empty"), EFailure::None,       ""         },
+        {"nothing there",    folder.Path("none"),  EFailure::NotFound,   ""         },
+        {"folder",           folder.Path(),        EFailure::NotRegular, ""         },
+        {"device",           "/dev/zero",          EFailure::NotRegular, ""         },
+        {"pipe, not waited", folder.Path("pipe"),  EFailure::NotRegular, ""         },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CMappedFile file;
+        ASSERT_EQ(file.Open(folder.Path("full")), EFailure::None); // which is replaced in every case
+        EXPECT_EQ(file.Open(row.path), row.failure);
+        EXPECT_EQ(file.Text(), row.text);
+        EXPECT_EQ(file.Bytes().size(), file.Text().size());
+    }
+}
+
+TEST(CMappedFile, KeepsItsBytesWhenMovedAndAfterForgetting)
+{
+    const CTempFolder folder;
+    std::string text(100000, 'x');
+    std::iota(text.begin(), text.end(), '\0');
+    WriteBytes(folder.Path("a"), text);
+    CMappedFile first;
+    ASSERT_EQ(first.Open(folder.Path("a")), EFailure::None);
+    CMappedFile second(std::move(first));
+    CMappedFile third;
+    third = std::move(second);
+    for (const size_t offset : {size_t{0}, size_t{5000}, text.size(), text.size() + 1, SIZE_MAX})
+    {
+        third.Forget(offset);
+        EXPECT_EQ(third.Text(), text) << offset;
+    }
+    third.Close();
+    third.Forget(100);
+    EXPECT_TRUE(third.Text().empty());
+}
+
+TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("a.htr");
+    WriteBytes(path, "old");
+    fs::permissions(path, fs::perms(0640));
+    CSafeFile file;
+    ASSERT_TRUE(file.Open(path));
+    EXPECT_EQ(ModeOf(file.PrivatePath()) & 07, 0u); // not laid open meanwhile
+    EXPECT_TRUE(file.Write("new "));
+    const std::byte bytes[] = {std::byte{'0'}, std::byte{0}};
+    EXPECT_TRUE(file.Write(bytes));
+    EXPECT_EQ(ReadBytes(path), "old");
+    EXPECT_EQ(ReadBytes(file.PrivatePath()), std::string("new 0\0", 6));
+    EXPECT_TRUE(file.Commit());
+    EXPECT_FALSE(file.Commit());
+    EXPECT_EQ(ReadBytes(path), std::string("new 0\0", 6));
+    EXPECT_EQ(ModeOf(path), 0640u);
+    EXPECT_EQ(EntryCount(folder), 1u);
+}
+
+TEST(CSafeFile, NewFilesHaveTheUsersModeAndAnyName)
+{
+    const CTempFolder folder;
+    const std::string longest = folder.Path(std::string(251, 'n') + ".htr");
+    const mode_t mask = umask(027);
+    EXPECT_TRUE(Save(longest, "text"));
+    umask(mask);
+    EXPECT_EQ(ModeOf(longest), 0640u);
+    EXPECT_TRUE(Save(folder.Path("back\\slash"), ""));
+    EXPECT_EQ(ReadBytes(folder.Path("back\\slash")), "");
+    EXPECT_EQ(EntryCount(folder), 2u);
+}
+
+TEST(CSafeFile, WithoutACommitOrOnAFullDiskTheOldFileStays)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("a.htr");
+    WriteBytes(path, "old");
+    {
+        CSafeFile file;
+        ASSERT_TRUE(file.Open(path));
+        EXPECT_TRUE(file.Write("new"));
+        ASSERT_TRUE(file.Open(path)); // begins anew
+        EXPECT_TRUE(file.Write("newer"));
+    }
+    EXPECT_EQ(ReadBytes(path), "old");
+    EXPECT_EQ(EntryCount(folder), 1u);
+
+    CSafeFile file;
+    ASSERT_TRUE(file.Open(path));
+    bool written = true;
+    {
+        const CFullDisk full(4096);
+        written = file.Write(std::string(10000, 'x'));
+    }
+    EXPECT_FALSE(written);
+    EXPECT_FALSE(file.Write("and there is room again"));
+    EXPECT_FALSE(file.Commit());
+    EXPECT_EQ(ReadBytes(path), "old");
+    EXPECT_EQ(EntryCount(folder), 1u);
+}
+
+TEST(CSafeFile, SymbolicLinksAreFollowed)
+{
+    const CTempFolder folder;
+    CreateFolder(folder.Path("real"));
+    WriteBytes(folder.Path("real/a"), "old");
+    fs::create_symlink("real/a", folder.Path("one"));
+    fs::create_symlink(folder.Path("one"), folder.Path("two"));
+    fs::create_symlink("real/b", folder.Path("dangling"));
+    EXPECT_TRUE(Save(folder.Path("two"), "new"));
+    EXPECT_EQ(ReadBytes(folder.Path("real/a")), "new");
+    EXPECT_TRUE(Save(folder.Path("dangling"), "made"));
+    EXPECT_EQ(ReadBytes(folder.Path("real/b")), "made");
+    for (const char* link : {"one", "two", "dangling"})
+        EXPECT_TRUE(fs::is_symlink(folder.Path(link))) << link;
+}
+
+TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
+{
+    const CTempFolder folder;
+    WriteBytes(folder.Path("readonly"), "old");
+    fs::permissions(folder.Path("readonly"), fs::perms::owner_read);
+    fs::create_symlink("readonly", folder.Path("link"));
+    fs::create_symlink("ring", folder.Path("ring"));
+    fs::create_directory(folder.Path("folder"));
+    const size_t before = EntryCount(folder);
+    const struct
+    {
+        const char* what;
+        std::string path;
+    } rows[] = {
+        {"read-only file",        folder.Path("readonly")},
+        {"link to it",            folder.Path("link")    },
+        {"folder",                folder.Path("folder")  },
+        {"folder with separator", folder.Path("folder/") },
+        {"device",                "/dev/null"            },
+        {"no such folder",        folder.Path("none/a")  },
+        {"links in a ring",       folder.Path("ring")    },
+        {"no name",               ""                     },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CSafeFile file;
+        EXPECT_FALSE(file.Open(row.path));
+        EXPECT_FALSE(file.Write("new"));
+        EXPECT_FALSE(file.Commit());
+    }
+    EXPECT_EQ(ReadBytes(folder.Path("readonly")), "old");
+    EXPECT_EQ(EntryCount(folder), before);
+}
+
+TEST(CSafeFile, PrivateFilesLieBesideAndDiffer)
+{
+    const CTempFolder folder;
+    const std::string first = CreatePrivateFile(folder.Path("walk.htr"), ".htr");
+    const std::string second = CreatePrivateFile(folder.Path("walk.htr"), ".htr");
+    EXPECT_NE(first, second);
+    for (const std::string& path : {first, second})
+    {
+        EXPECT_EQ(SplitPath(path).folder, folder.Path());
+        EXPECT_TRUE(HasExtension(path, ".htr"));
+        EXPECT_EQ(ReadBytes(path), "");
+    }
+    EXPECT_EQ(CreatePrivateFile(folder.Path("none/walk.htr"), ".htr"), "");
+}
+
+} // namespace gw
