@@ -8,44 +8,62 @@
 #include <CLI/CLI.hpp>
 
 #include <algorithm>
+#include <charconv>
 #include <cmath>
 #include <cstdio>
+#include <functional>
 #include <optional>
 
 namespace gw {
 
 namespace {
 
-struct OptionBinder
+// Tells the parser of an option, by what its value is.
+class OptionBinder
 {
-    CLI::App& app;
-    const COptionRow& row;
-    COptions& options;
+public:
+    OptionBinder(CLI::App& app, const COptionRow& row, COptions& options)
+        : m_kApp(app), m_kRow(row), m_kOptions(options)
+    {
+    }
 
     CLI::Option* operator()(bool COptions::*target) const
     {
-        return app.add_flag(std::string(row.names), options.*target);
+        return m_kApp.add_flag(std::string(m_kRow.names), m_kOptions.*target);
     }
     CLI::Option* operator()(std::string COptions::*target) const
     {
-        return app.add_option(std::string(row.names), options.*target);
+        return m_kApp.add_option(std::string(m_kRow.names), m_kOptions.*target);
     }
     CLI::Option* operator()(int64_t COptions::*target) const
     {
-        return app.add_option(std::string(row.names), options.*target);
+        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+            const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), *number);
+            if (error != std::errc() || end != text.data() + text.size())
+                throw CLI::ValidationError(Quoted(text) + " is no integer");
+        });
     }
-    // Read by the project's own parser, which knows no locale.
     CLI::Option* operator()(float COptions::*target) const
     {
-        const auto take = [value = &(options.*target)](const std::string& text) {
+        return Add([number = &(m_kOptions.*target)](const std::string& text) {
             ENumber kind = ENumber::None;
-            const float number = static_cast<float>(ParseDouble(text, kind));
-            if (kind != ENumber::Whole || !(number > 0.0f) || !std::isfinite(number))
+            *number = static_cast<float>(ParseDouble(text, kind));
+            if (kind != ENumber::Whole || !(*number > 0.0f) || !std::isfinite(*number))
                 throw CLI::ValidationError(Quoted(text) + " is no number above 0");
-            *value = number;
-        };
-        return app.add_option_function<std::string>(std::string(row.names), take);
+        });
     }
+
+private:
+    // Numbers are read by the project's own means, which know no locale and take nothing for a number that is
+    // none.
+    CLI::Option* Add(const std::function<void(const std::string&)>& take) const
+    {
+        return m_kApp.add_option_function<std::string>(std::string(m_kRow.names), take);
+    }
+
+    CLI::App& m_kApp;
+    const COptionRow& m_kRow;
+    COptions& m_kOptions;
 };
 
 CLI::Validator OneOf(std::string_view choices)
@@ -68,7 +86,7 @@ void AddOptions(CLI::App& app, const CCommand& command, COptions& options)
     {
         if (!(OptionsOf(command) & row.bit))
             continue;
-        CLI::Option* option = std::visit(OptionBinder{app, row, options}, row.target);
+        CLI::Option* option = std::visit(OptionBinder(app, row, options), row.target);
         option->required((command.required & row.bit) != 0);
         if (!row.choices.empty())
             option->check(OneOf(row.choices));
@@ -142,8 +160,9 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
         wrong = error.what();
     }
     const std::vector<std::string> unknown = app.remaining();
-    if (!unknown.empty())
-        return RefuseUnknown(command, unknown.front());
+    const auto option = std::ranges::find_if(unknown, [](const std::string& word) { return word != "--"; });
+    if (option != unknown.end())
+        return RefuseUnknown(command, *option);
     if (!wrong.empty())
         return RefuseFor(command, Printable(wrong));
     if (options.files.size() < command.leastOperands)

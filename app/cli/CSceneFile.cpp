@@ -16,6 +16,11 @@ bool HasContainerName(const std::string& path)
     return HasExtension(path, ".orn") || HasExtension(path, ".Kinetra");
 }
 
+bool IsUnreachable(EFailure reason)
+{
+    return reason == EFailure::NotFound || reason == EFailure::NotRegular || reason == EFailure::ReadError;
+}
+
 } // namespace
 
 bool CSceneFile::Load(const std::string& path)
@@ -24,7 +29,8 @@ bool CSceneFile::Load(const std::string& path)
     if (!m_bContainer && (m_kMotion.Load(path) || Failure().reason != EFailure::UnknownFormat))
         return !Failure();
     const bool isContainer = m_kScene.LoadFile(path, false);
-    m_bContainer = m_bContainer || isContainer;
+    // What cannot be opened at all is not of an unknown kind.
+    m_bContainer = m_bContainer || isContainer || IsUnreachable(m_kScene.Record().Failure().reason);
     return isContainer;
 }
 

@@ -115,11 +115,11 @@ bool CConversion::Convert()
     return m_kAccount.frames > 0 || RefuseEmpty(); // a container may say that it ends before it begins
 }
 
-// Where the profile fits, the reason was reported.
+// Where no bone is missing, the reason was reported.
 void CConversion::TellMisfit()
 {
     CProfileFit fit;
-    if (!m_kContent.Measure(m_kContent.ProfilePath(), fit) || fit.IsWhole())
+    if (!m_kContent.Measure(m_kContent.ProfilePath(), fit) || fit.missing.empty())
         return;
     m_kWindow.Report(MisfitReport(m_kJob.source, fit));
     m_kAccount.misfit = fit;

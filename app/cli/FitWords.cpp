@@ -2,6 +2,7 @@
 
 #include "CJsonWriter.h"
 #include "CReport.h"
+#include "HostBones.h"
 #include "ProfileFit.h"
 #include "Words.h"
 
@@ -54,7 +55,7 @@ std::string MissingLines(const CProfileFit& fit)
         lines += MissingLine(missing);
     }
     if (!fit.drivesRoot && fit.missing.empty())
-        lines = "  no row drives the target's root bone";
+        lines = "  no row drives the target's root bone " + Quoted(kRootBone);
     return lines;
 }
 

@@ -3,6 +3,7 @@
 #include "CSceneFile.h"
 #include "Commands.h"
 #include "InfoContainer.h"
+#include "PackageBlocks.h"
 #include "Paths.h"
 #include "ReportJson.h"
 #include "Text.h"
@@ -33,10 +34,11 @@ Timing TimingOf(const CKeyframeControl* track)
     return {static_cast<int64_t>(track->m_kKeyTimes.size()), track->m_fEndTime, track->m_fFrequency};
 }
 
-std::string FormatOf(const std::string& path, const CSceneFile& file)
+// A batch run writes packages as .orn, so that the name does not tell.
+std::string FormatOf(const std::string& path, CSceneFile& file)
 {
     if (file.IsContainer())
-        return HasExtension(path, ".Kinetra") ? "Kinetra" : "orn";
+        return FindPackage(file.Scene()).info ? "Kinetra" : "orn";
     return LowerCase(SplitPath(path).extension).substr(1);
 }
 

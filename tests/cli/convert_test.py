@@ -1,0 +1,152 @@
+"""Conversions as whole runs: what is written, what is refused, and what stays as it was."""
+import json
+import os
+import shlex
+import subprocess
+import unittest
+
+from harness import ASSETS, DONE, FAILED, WALK, CliTest, main
+from made import BVH, bvh, profile
+
+OLD = b"an older result"
+
+# The walk by its own names; "Poser BVH" is the stock profile that fits it.
+REFUSED = [  # what, arguments behind "convert", words on standard error
+    ("an output that exists", "walk.bvh -o old.Kinetra", ["old.Kinetra", "--force"]),
+    ("the default output exists", "old.bvh", ["old.Kinetra", "--force"]),
+    ("an .htr that exists", "walk.bvh -o old.HTR", ["old.htr", "--force"]),
+    ("a folder as output, even by force", "walk.bvh -o folder.Kinetra --force", ["folder.Kinetra", "folder"]),
+    ("no such source", "none.bvh -o a.Kinetra", ["none.bvh", "cannot be opened"]),
+    ("a source of an unknown kind", "made.prf -o a.Kinetra", ["made.prf", ".bvh"]),
+    ("no folder for the output", "walk.bvh -o none/a.Kinetra", ["none/a.Kinetra", "cannot be written"]),
+    ("a file where the folder should be", "walk.bvh -o old.bvh/a.htr", ["cannot be written"]),
+    ("a slip in a profile's name", "walk.bvh -o a.htr --profile \"Poser BHV\"", ["Poser BHV", '"Poser BVH"']),
+    ("no such profile file", "walk.bvh -o a.htr --profile none.prf", ["none.prf", "cannot be read"]),
+    ("a profile for other bones", "walk.bvh -o a.htr --profile made.prf",
+     ["Unable to convert", '"Made": 3 of 5 rows fit', 'line 4: the source has no bone "hipp"',
+      'nearest is "hip"', 'line 5: the source has no bone "Xyzzy"']),
+    ("a profile without the root bone", "walk.bvh -o a.htr --profile rootless.prf", ["rootless.prf", "root bone"]),
+    ("bones that no profile knows", "strange.bvh -o a.htr", ["strange.bvh", "no installed profile fits", 'no bone "hip"']),
+    ("a motion without frames", "still.bvh -o a.htr --profile small.prf", ["no frames"]),
+    ("no target skeleton", "walk.bvh -o a.htr --data-dir nothing", ["base.htr"]),
+]
+
+
+class Convert(CliTest):
+    def setUp(self):
+        super().setUp()
+        walk = WALK.read_bytes()
+        for name in ("walk.bvh", "old.bvh"):
+            self.write(name, walk)
+        for name in ("old.Kinetra", "old.htr"):
+            self.write(name, OLD)
+        (self.folder / "folder.Kinetra").mkdir()
+        self.write("made.prf", profile("Made", [("hipp", "LowerTorso"), ("Xyzzy", "Waist"), ("neck", "Neck")]))
+        self.write("rootless.prf", profile("Rootless", [("neck", "Neck")]))
+        self.write("small.prf", profile("Small", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")]))
+        self.write("small.bvh", BVH)
+        self.write("strange.bvh", bvh("ROOT Hips", "ROOT Alpha").replace("JOINT Chest", "JOINT Beta"))
+        self.write("still.bvh", bvh("Frames: 3", "Frames: 0"))
+        self.before = self.files()
+
+    def made(self):
+        return sorted(set(self.files()) - set(self.before))
+
+    def test_what_cannot_be_done_is_said_and_leaves_everything_as_it_was(self):
+        for what, line, words in REFUSED:
+            with self.subTest(what):
+                arguments = shlex.split(line)
+                run = self.run_program if "--data-dir" in arguments else self.with_assets
+                result = run("convert", *arguments)
+                self.assertEqual((result.code, result.out), (FAILED, ""), result.err)
+                self.assert_words(result, words)
+                self.assertEqual(self.made(), [])
+                self.assertEqual((self.read("old.Kinetra"), self.read("old.htr")), (OLD, OLD))
+
+    def test_the_result_is_a_package_beside_the_source_unless_told_otherwise(self):
+        rows = [  # what, arguments, the file that comes of them
+            ("beside the source", [], "walk.Kinetra"),
+            ("a name without extension", ["-o", "plain"], "plain.Kinetra"),
+            ("an .htr by its name", ["-o", "moved.htr"], "moved.htr"),
+            ("an .htr in capitals", ["-o", "LOUD.HTR"], "LOUD.htr"),
+        ]
+        for what, arguments, name in rows:
+            with self.subTest(what):
+                known = self.files()
+                result = self.succeed("convert", "walk.bvh", *arguments)
+                self.assertEqual(sorted(set(self.files()) - set(known)), [name])
+                self.assertIn(name, result.out)
+        self.succeed("extract", "walk.Kinetra", "-o", "inner.htr")
+        self.assertEqual(self.read("inner.htr"), self.read("moved.htr"))
+
+    def test_an_htr_beside_a_package_stays_as_it_was(self):
+        self.succeed("convert", "walk.bvh", "-o", "old.Kinetra", "--force")
+        self.assertEqual(self.read("old.htr"), OLD)
+        self.assertNotEqual(self.read("old.Kinetra"), OLD)
+
+    def test_existing_outputs_are_passed_over_when_asked(self):
+        result = self.succeed("convert", "walk.bvh", "-o", "old.Kinetra", "--skip-existing")
+        self.assertIn("skipped", result.out)
+        self.assertEqual(self.read("old.Kinetra"), OLD)
+
+    def test_a_dry_run_tells_profile_and_name_and_writes_nothing(self):
+        result = self.succeed("convert", "walk.bvh", "--dry-run", "--json")
+        plan = json.loads(result.out)
+        self.assertEqual((plan["outcome"], plan["output"], plan["profile"]), ("planned", "walk.Kinetra", "Poser BVH"))
+        self.assertEqual(self.with_assets("convert", "none.bvh", "--dry-run").code, FAILED)
+        self.assertEqual(self.made(), [])
+
+    def test_a_profile_file_goes_before_an_installed_one_of_its_name(self):
+        text = (ASSETS / "PoserBVH.prf").read_text()
+        self.write("mine.prf", text.replace("FrameRate 30", "FrameRate 60"))
+        self.succeed("convert", "walk.bvh", "-o", "stock.htr")
+        self.succeed("convert", "walk.bvh", "-o", "mine.htr", "--profile", "mine.prf")
+        count = [len(self.read(name).splitlines()) for name in ("stock.htr", "mine.htr")]
+        self.assertGreater(count[0], 1.5 * count[1])  # 120 / rate frames for each
+
+    def test_without_legs_the_feet_differ_and_nothing_else(self):
+        self.succeed("convert", "walk.bvh", "-o", "with.htr")
+        self.succeed("convert", "walk.bvh", "-o", "without.htr", "--no-legs")
+        nodes = [json.loads(self.run_program("pose", name, "--frame", 40).out)["nodes"]
+                 for name in ("with.htr", "without.htr")]
+        changed = {a["name"] for a, b in zip(*nodes) if a["local"] != b["local"]}
+        self.assertTrue(changed)
+        self.assertLessEqual(changed, {"LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
+
+    def test_a_full_disk_is_said_and_leaves_the_old_file(self):
+        for arguments in (["-o", "old.Kinetra", "--force"], ["-o", "old.htr", "--force"], ["-o", "new.Kinetra"]):
+            with self.subTest(arguments[1]):
+                result = self.with_assets("convert", "walk.bvh", *arguments, file_limit=20000)
+                self.assertEqual((result.code, result.out), (FAILED, ""), result.err)
+                self.assert_words(result, [arguments[1], "cannot be written"])
+                self.assertEqual(self.made(), [])
+                self.assertEqual((self.read("old.Kinetra"), self.read("old.htr")), (OLD, OLD))
+
+    @unittest.skipIf(os.geteuid() == 0, "root may write everywhere")
+    def test_a_folder_that_takes_no_file_is_said(self):
+        locked = self.folder / "locked"
+        locked.mkdir(mode=0o500)
+        self.assertEqual(self.with_assets("convert", "walk.bvh", "-o", "locked/a.Kinetra").code, FAILED)
+        self.assertEqual(self.made(), [])
+
+    def test_nothing_of_the_users_settings_is_written(self):
+        self.succeed("convert", "walk.bvh", "-o", "a.htr")
+        self.assertFalse((self.folder / "home").exists())
+
+    def test_a_desktop_that_writes_decimal_commas_gives_the_same_bytes(self):
+        self.succeed("convert", "walk.bvh", "-o", "plain.htr")
+        locales = self.folder / "locales"
+        locales.mkdir()
+        made = subprocess.run(["localedef", "-i", "de_DE", "-f", "UTF-8", str(locales / "de_DE.UTF-8")],
+                              capture_output=True, check=False)
+        if made.returncode != 0:
+            self.skipTest("this machine cannot make a locale")
+        self.environment.update(LOCPATH=str(locales), LC_ALL="de_DE.UTF-8", LANG="de_DE.UTF-8")
+        self.succeed("convert", "walk.bvh", "-o", "comma.htr")
+        self.assertEqual(self.read("plain.htr"), self.read("comma.htr"))
+        text = self.run_program("info", "walk.bvh").out
+        self.assertRegex(text, r"rate:\s+30(\.\d+)? per second")
+
+
+if __name__ == "__main__":
+    main()

@@ -1,0 +1,177 @@
+"""Motion files that are broken, strange or enormous: a sentence with the place, and nothing else."""
+import json
+
+from harness import DONE, FAILED, CliTest, main
+from made import BVH, bvh, htr, profile
+
+ROW = "1 90 0 0 0 0 90 0 0"
+DOUBLED = bvh("CHANNELS 3 Z", "CHANNELS 6 Xposition Yposition Zposition Z")
+for number in range(3):
+    DOUBLED = DOUBLED.replace("\n%d 90 0 0 0 0" % number, "\n%d 90 0 0 0 0 0 10 0" % number)
+
+
+def nested(depth):
+    joint = "JOINT n%d\n{\nOFFSET 0 1 0\nCHANNELS 3 Zrotation Xrotation Yrotation\n"
+    inner = "".join(joint % i for i in range(depth)) + "}\n" * depth
+    return bvh("  JOINT Chest", inner + "  JOINT Chest")
+
+
+BROKEN = [  # what, content, line or 0, word of the sentence
+    ("an empty file", "", 0, '"HIERARCHY"'),
+    ("no BVH at all", "\x00\x01\x02" * 100, 1, '"HIERARCHY"'),
+    ("another text", "solid cube\nfacet\n", 2, '"HIERARCHY"'),
+    ("no motion section", BVH.split("MOTION")[0], 15, '"MOTION"'),
+    ("no root", BVH.replace("ROOT Hips", "JOINT Hips"), 2, "ROOT"),
+    ("an offset of two numbers", bvh("OFFSET 0 10 0", "OFFSET 0 10"), 8, "fewer values"),
+    ("an offset of words", bvh("OFFSET 0 10 0", "OFFSET a b c"), 8, "number"),
+    ("a name over 255 characters", bvh("Chest", "C" * 256), 6, "255"),
+    ("more channels than words", bvh("CHANNELS 3 Z", "CHANNELS 999999999 Z"), 9, "fewer values"),
+    ("an empty line before the frames", bvh("MOTION\n", "MOTION\n\n"), 17, "empty line"),
+    ("no frame time", bvh("Frame Time: 0.0333333\n", ""), 18, "Frame Time"),
+    ("a frame time of nothing", bvh("0.0333333", "0"), 18, "number"),
+    ("a frame time that is no number", bvh("0.0333333", "nan"), 18, "number"),
+    ("fewer rows than frames", bvh("Frames: 3", "Frames: 4"), 17, "fewer rows"),
+    ("more frames than any file has", bvh("Frames: 3", "Frames: 2000000000"), 17, "fewer rows"),
+    ("a row too short for the root", bvh(ROW, "1 90 0 0"), 20, "fewer values"),
+    ("a word in a row", bvh(ROW, "1 90 x 0 0 0 90 0 0"), 20, '"x"'),
+    ("no number in a row", bvh(ROW, "1 90 nan 0 0 0 90 0 0"), 20, '"nan"'),
+    ("an infinity in a row", bvh(ROW, "1 90 0 0 0 0 -inf 0 0"), 20, '"-inf"'),
+    ("a number that no float holds", bvh(ROW, "1 90 0 0 0 0 1e39 0 0"), 20, '"1e39"'),
+    ("a hundred thousand levels", nested(100000), 0, "deep"),
+]
+
+BROKEN_HTR = [
+    ("an empty file", "", 0, "Hierarchy"),
+    ("a ring of bones", htr("Hips GLOBAL", "Hips Chest"), 22, '"Hips"'),
+    ("a bone that is its own parent", htr("Chest Hips", "Chest Chest"), 26, '"Chest"'),
+    ("more frames than any file has", htr("NumFrames 2", "NumFrames 2000000000"), 6, "NumFrames"),
+    ("no number in a row", htr("2 1 0 0 0 0 90 1", "2 nan 0 0 0 0 90 1"), 25, '"nan"'),
+    ("an infinity in the rest pose", htr("Hips 0 90 0", "Hips 0 inf 0"), 20, '"inf"'),
+]
+
+WARNED = [  # what, content, code of the warning, line
+    ("a short row", bvh(ROW, "1 90 0 0 0 0 90"), "short-row", 20),
+    ("a number with something stuck to it", bvh(ROW, "1 90 0.0-7.5 0 0 0 90 0 0"), "stuck-number", 20),
+    ("positions that repeat the offsets", DOUBLED, "doubled-offsets", None),
+    ("a channel that there is not", bvh("CHANNELS 3 Zrotation", "CHANNELS 3 Wrotation"), "unknown-channel", 9),
+]
+
+STRANGE = [  # legal, and read without a word: what, content
+    ("line ends of another system", BVH.replace("\n", "\r\n")),
+    ("a byte order mark", "\ufeff" + BVH),
+    ("tabs and commas", bvh(ROW, ROW.replace(" ", "\t,"))),
+    ("no line end behind the last row", BVH.rstrip()),
+    ("two joints of one name", bvh("JOINT Chest", "JOINT Hips")),
+    ("rows behind the last frame", BVH + ROW + "\n"),
+    ("a name of bytes that are no UTF-8", BVH.encode().replace(b"Chest", b"Ch\xff\x1b[31mst")),
+]
+
+
+class Files(CliTest):
+    def setUp(self):
+        super().setUp()
+        self.write("small.prf", profile("Small", [("Hips", "LowerTorso")]))
+        self.write("out.htr", "old")
+
+    def assert_refused(self, name, rows):
+        commands = [["convert", name, "-o", "out.htr", "--force", "--profile", "small.prf"],
+                    ["transcode", name, "out.bvh"], ["info", name], ["pose", name, "--frame", 1]]
+        for what, content, line, word in rows:
+            self.write(name, content)
+            for command in commands:
+                with self.subTest(what, command=command[0]):
+                    result = self.with_assets(*command)
+                    self.assertEqual((result.code, result.out), (FAILED, ""), result.err)
+                    self.assert_words(result, ["%s:%d: " % (name, line) if line else name + ":", word])
+                    self.assertEqual(self.files(), sorted(["out.htr", "small.prf", name]))
+                    self.assertEqual(self.read("out.htr"), b"old")
+
+    def test_a_broken_file_is_refused_with_its_place_and_cause(self):
+        self.assert_refused("take.bvh", BROKEN)
+
+    def test_so_is_a_broken_htr(self):
+        self.assert_refused("take.htr", BROKEN_HTR)
+
+    def test_what_an_author_did_not_mean_is_told(self):
+        for what, content, code, line in WARNED:
+            with self.subTest(what):
+                self.write("take.bvh", content)
+                result = self.run_program("info", "take.bvh", "--json")
+                self.assertEqual(result.code, DONE, result.err)
+                warnings = {w["code"]: w["where"] for w in json.loads(result.out)["warnings"]}
+                self.assertIn(code, warnings)
+                if line is not None:
+                    self.assertEqual(warnings[code], line)
+                self.assertIn("warning: take.bvh", result.err)
+                self.assertEqual(self.run_program("info", "take.bvh", "--quiet").err, "")
+
+    def test_what_is_only_strange_is_read(self):
+        for what, content in STRANGE:
+            with self.subTest(what):
+                self.write("take.bvh", content)
+                result = self.run_program("pose", "take.bvh", "--frame", 1)
+                self.assertEqual((result.code, result.err), (DONE, ""))
+                hips, chest = json.loads(result.out)["nodes"]
+                self.assertEqual(hips["local"][12:15], [1, 90, 0])
+                self.assertEqual([round(x, 5) for x in chest["world"][12:15]], [1, 100, 0])
+                self.assertEqual(chest["parent"], "Hips")
+
+    def test_every_beginning_of_a_file_is_read_or_refused(self):
+        for end in range(0, len(BVH), 7):
+            with self.subTest(end):
+                self.write("take.bvh", BVH[:end])
+                result = self.run_program("info", "take.bvh")
+                if result.code == FAILED:
+                    self.assertIn("take.bvh", result.err)
+
+    def test_a_folder_or_a_device_is_no_motion(self):
+        (self.folder / "folder.bvh").mkdir()
+        (self.folder / "device.bvh").symlink_to("/dev/zero")
+        for name in ("folder.bvh", "device.bvh"):
+            result = self.run_program("info", name)
+            self.assertEqual(result.code, FAILED)
+            self.assert_words(result, [name, "folder or a device"])
+
+    def test_a_result_that_cannot_be_shown_is_a_failure(self):
+        self.write("take.bvh", BVH)
+        with open("/dev/full", "wb") as full:
+            for command in (["info"], ["info", "--json"], ["pose", "--frame", "0"]):
+                result = self.run_program(*command, "take.bvh", stdout=full)
+                self.assertEqual(result.code, FAILED)
+                self.assert_words(result, ["standard output"])
+
+
+class Poses(CliTest):
+    def test_frames_outside_the_motion_take_its_ends(self):
+        self.write("take.bvh", BVH)
+        rows = [("before", -5, 0), ("first", 0, 0), ("last", 2, 2), ("behind", 3, 2), ("far", 10**15, 2)]
+        for what, frame, x in rows:
+            with self.subTest(what):
+                pose = json.loads(self.run_program("pose", "take.bvh", "--frame=%d" % frame).out)
+                self.assertEqual(pose["frame"], frame)
+                self.assertEqual(pose["nodes"][0]["local"][12:15], [x, 90, 0])
+
+    def test_matrices_are_of_row_vectors(self):
+        self.write("take.bvh", BVH)
+        hips, chest = json.loads(self.run_program("pose", "take.bvh", "--frame", 1).out)["nodes"]
+        quarter = [0, 1, 0, -1, 0, 0, 0, 0, 1]  # 90 degrees about Z: x goes to y, row by row
+        rotation = [chest["local"][4 * row + column] for row in range(3) for column in range(3)]
+        for value, expected in zip(rotation, quarter):
+            self.assertAlmostEqual(value, expected, places=5)
+        self.assertEqual(chest["local"][12:], [0, 10, 0, 1])
+        self.assertEqual(hips["parent"], None)
+
+    def test_a_motion_survives_being_written_as_bvh(self):
+        self.write("take.bvh", BVH)
+        self.assertEqual(self.run_program("transcode", "take.bvh", "again.bvh").code, DONE)
+        for frame in (0, 1):  # the writer leaves out the last frame
+            one, two = (json.loads(self.run_program("pose", name, "--frame", frame).out)["nodes"]
+                        for name in ("take.bvh", "again.bvh"))
+            for a, b in zip(one, two, strict=True):
+                for x, y in zip(a["world"], b["world"]):
+                    self.assertAlmostEqual(x, y, places=4)
+        self.assertEqual(self.run_program("transcode", "take.bvh", "again.bvh").code, FAILED)
+
+
+if __name__ == "__main__":
+    main()

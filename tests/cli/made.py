@@ -1,0 +1,125 @@
+"""Small files that the tests make themselves."""
+import struct
+
+# Two joints, three frames: the least that has a tree, rows and an end.
+BVH = """HIERARCHY
+ROOT Hips
+{
+  OFFSET 0 0 0
+  CHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation
+  JOINT Chest
+  {
+    OFFSET 0 10 0
+    CHANNELS 3 Zrotation Xrotation Yrotation
+    End Site
+    {
+      OFFSET 0 5 0
+    }
+  }
+}
+MOTION
+Frames: 3
+Frame Time: 0.0333333
+0 90 0 0 0 0 0 0 0
+1 90 0 0 0 0 90 0 0
+2 90 0 0 0 0 0 0 90
+"""
+
+
+HTR = """[Header]
+FileType htr
+DataType HTRS
+FileVersion 1
+NumSegments 2
+NumFrames 2
+DataFrameRate 30
+EulerRotationOrder ZYX
+CalibrationUnits mm
+RotationUnits Degrees
+GlobalAxisofGravity Y
+BoneLengthAxis Y
+ScaleFactor 1.000000
+[SegmentNames&Hierarchy]
+#CHILD\tPARENT
+Hips GLOBAL
+Chest Hips
+[BasePosition]
+#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength
+Hips 0 90 0 0 0 0 10
+Chest 0 10 0 0 0 0 5
+[Hips]
+#Fr Tx Ty Tz Rx Ry Rz SF
+1 0 0 0 0 0 0 1
+2 1 0 0 0 0 90 1
+[Chest]
+#Fr Tx Ty Tz Rx Ry Rz SF
+1 0 0 0 0 0 0 1
+2 0 0 0 0 0 0 1
+[EndOfFile]
+"""
+
+
+def bvh(old, new):
+    """The small motion with one text in it replaced."""
+    assert BVH.count(old) >= 1, old
+    return BVH.replace(old, new, 1)
+
+
+def htr(old, new):
+    assert HTR.count(old) >= 1, old
+    return HTR.replace(old, new, 1)
+
+
+def profile(name, rows, rate=30):
+    lines = [name, "FrameRate %d" % rate, "Position 0 0 0"]
+    lines += ["%s <---> %s 0,0,0,1,2,3" % row for row in rows]
+    return "\n".join(lines) + "\n"
+
+
+IDENTITY = [1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1]
+
+
+def moved(x, y, z):
+    return IDENTITY[:12] + [x, y, z, 1]
+
+
+class Container:
+    """Writes scene containers of nodes and tracks, record by record, with ids of the caller's choice."""
+
+    def __init__(self):
+        self.bytes = b"TKOrrin Version 1.20\0" + self.string("_OrrinThumbnail")
+        self.bytes += struct.pack("<iiiHiiIIIBI", 0, 0, 0, 0, 96, 96, 0, 1, 0, 0, 0)
+
+    @staticmethod
+    def string(text):
+        text = text if isinstance(text, bytes) else text.encode()
+        return struct.pack("<I", len(text)) + text
+
+    @staticmethod
+    def floats(values):
+        return struct.pack("<%df" % len(values), *values)
+
+    def record(self, kind, number, name, links, body, root):
+        self.bytes += self.string("_OrrinRoot") if root else b""
+        self.bytes += self.string(kind) + struct.pack("<I", number) + self.string(name)
+        self.bytes += struct.pack("<III", *links) + body
+        return self
+
+    def node(self, number, name="", matrix=IDENTITY, children=(), control=0, root=False):
+        body = self.floats(matrix) + struct.pack("<BIIBBI", 1, 0, 1, 1, 1, len(children))
+        body += struct.pack("<%dI" % len(children), *children)
+        return self.record("CNode", number, name, (control, 0, 0), body, root)
+
+    def track(self, number, target, positions, frame_seconds=0.5, name="CKeyFrameControl"):
+        count = len(positions)
+        body = struct.pack("<IffffBII", 0, 0.0, count - 1.0, 0.0, frame_seconds, 1, target, 0)
+        body += self.floats(IDENTITY) + struct.pack("<BII", 0, 0, count)
+        body += b"".join(self.floats(p) for p in positions) + struct.pack("<II", 0, count)
+        body += self.floats(range(count)) + struct.pack("<IIII", 0, 0, 0, 0)
+        return self.record("CKeyframeControl", number, name, (0, 0, 0), body, False)
+
+
+def one_bone_scene():
+    """A bone that rises for three frames of half a second."""
+    scene = Container().node(1, "hip", control=2, root=True)
+    return scene.track(2, 1, [(0, 90, 0), (0, 91, 0), (0, 92, 0)]).bytes

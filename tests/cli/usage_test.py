@@ -1,0 +1,82 @@
+"""What the program answers to a command line that is wrong, and to a question for help."""
+import shlex
+
+from harness import DONE, FAILED, USAGE, CliTest, main
+
+COMMANDS = ("convert", "batch", "info", "pose", "transcode", "resave", "extract", "package", "profiles", "compare")
+
+WRONG = [  # what, arguments, words on standard error
+    ("no command", "", ["a command is missing", "--help"]),
+    ("a slip in a command", "convret a.bvh", ["convret", "'convert'"]),
+    ("a word that is near nothing", "frobnicate", ["no command", "--help"]),
+    ("an option before the command", "--json info a.bvh", ["--json"]),
+    ("a slip in an option", "convert a.bvh --forse", ["--forse", "'--force'"]),
+    ("a slip in an option with a value", "convert a.bvh --profle=x", ["--profle", "'--profile'"]),
+    ("an option of another command", "info a.bvh --force", ["info has no option", "--force"]),
+    ("a slip is told before what is missing", "pose a.bvh --fram 3", ["--fram", "'--frame'"]),
+    ("no operand", "info", ["info needs FILE", "usage: gaitwright info FILE"]),
+    ("one operand of two", "resave a.orn", ["needs IN OUT"]),
+    ("an operand too many", "info a.bvh b.bvh", ["b.bvh"]),
+    ("a required option is missing", "pose a.bvh", ["--frame"]),
+    ("an option without its value", "pose a.bvh --frame", ["--frame"]),
+    ("an option twice", "pose a.bvh --frame 1 --frame 2", ["--frame"]),
+    ("a frame that is no integer", "pose a.bvh --frame 1.5", ["1.5"]),
+    ("a frame that no integer holds", "pose a.bvh --frame 99999999999999999999", ["--frame"]),
+    ("a rate of nothing", "package a.htr b.Kinetra --rate 0", ['"0"', "above 0"]),
+    ("a rate below nothing", "package a.htr b.Kinetra --rate=-30", ["above 0"]),
+    ("a rate that is no number", "package a.htr b.Kinetra --rate nan", ["nan"]),
+    ("a rate without end", "package a.htr b.Kinetra --rate inf", ["inf"]),
+    ("a rate with something stuck to it", "package a.htr b.Kinetra --rate 30fps", ["30fps"]),
+    ("a job that there is not", "batch . --job fbx", ["fbx", "htr|orn"]),
+    ("contrary wishes", "convert a.bvh --force --skip-existing", ["exclude each other"]),
+    ("a result of another kind", "convert a.bvh -o a.fbx", ["a.fbx", ".Kinetra", ".htr"]),
+    ("several sources without a folder", "convert a.bvh b.bvh", ["--out-dir"]),
+    ("a name for several results", "convert a.bvh b.bvh -o c.htr --out-dir d", ["-o"]),
+    ("two sources of one stem", "convert x/a.bvh y/a.bvh --out-dir d", ["y/a.bvh", "a.Kinetra"]),
+    ("an .htr of what is none", "transcode a.bvh a.htr", ["a.htr", ".bvh"]),
+    ("frames of a .bvh scaled", "transcode a.htr a.bvh --frame-scale 2", ["--frame-scale"]),
+]
+
+
+class Usage(CliTest):
+    def test_a_wrong_command_line_is_answered_with_the_right_word(self):
+        for what, line, words in WRONG:
+            with self.subTest(what):
+                result = self.run_program(*shlex.split(line))
+                self.assertEqual((result.code, result.out), (USAGE, ""), result.err)
+                self.assert_words(result, words)
+                self.assertEqual(self.files(), [])
+
+    def test_control_characters_of_an_argument_do_not_reach_the_terminal(self):
+        result = self.run_program("\x1b[2Jconvert")
+        self.assertNotIn("\x1b", result.err)
+
+    def test_the_help_names_every_command(self):
+        result = self.run_program("--help")
+        self.assertEqual((result.code, result.err), (DONE, ""))
+        for command in COMMANDS:
+            self.assertIn("\n  " + command + " ", result.out)
+
+    def test_every_command_has_a_help_with_an_example(self):
+        for command in COMMANDS:
+            with self.subTest(command):
+                result = self.run_program(command, "--help")
+                self.assertEqual((result.code, result.err), (DONE, ""))
+                self.assertIn("Usage: gaitwright " + command, result.out)
+                self.assertIn("Example:\n  gaitwright " + command, result.out)
+
+    def test_every_example_is_a_right_command_line(self):
+        for command in COMMANDS:
+            with self.subTest(command):
+                example = self.run_program(command, "--help").out.split("Example:\n  gaitwright ")[1]
+                result = self.run_program(*shlex.split(example))
+                self.assertEqual(result.code, FAILED, result.err)  # its files are not there
+
+    def test_a_minus_alone_ends_the_options(self):
+        result = self.run_program("info", "--", "--json")
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["--json: the file cannot be opened"])
+
+
+if __name__ == "__main__":
+    main()
