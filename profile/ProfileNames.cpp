@@ -14,14 +14,6 @@ using Names = std::vector<std::string>;
 // As many digits as can be counted up without leaving 32 bits.
 constexpr size_t kDigitLimit = 9;
 
-Names::const_iterator FindName(std::string_view name, const Names& names)
-{
-    const auto same = [name = CutTrailing(name)](const std::string& other) {
-        return EqualNoCase(CutTrailing(other), name);
-    };
-    return std::ranges::find_if(names, same);
-}
-
 // Cuts "(7)" off the end of a name and answers 7; 0 for a name that ends otherwise.
 int CutNumber(std::string_view& name)
 {
@@ -59,26 +51,24 @@ std::string_view FirstCharacters(std::string_view text, size_t count)
 
 bool IsNameInUse(std::string_view name, const Names* inUse)
 {
-    return inUse && FindName(name, *inUse) != inUse->end();
+    const auto same = [name = CutTrailing(name)](const std::string& other) {
+        return EqualNoCase(CutTrailing(other), name);
+    };
+    return inUse && std::ranges::any_of(*inUse, same);
 }
 
 std::string NextFreeName(std::string_view name, const Names* inUse)
 {
     if (!IsNameInUse(name, inUse))
         return std::string(name);
-    const auto own = FindName(name, *inUse);
     std::string_view base = CutTrailing(name);
     int number = CutNumber(base);
+    std::string next;
     // Each number gives another name, so at most one more than there are names is tried.
-    for (;;)
-    {
-        std::string next = Numbered(base, ++number);
-        const bool taken = std::any_of(inUse->begin(), inUse->end(), [&](const std::string& other) {
-            return &other != &*own && EqualNoCase(CutTrailing(other), next);
-        });
-        if (!taken)
-            return next;
-    }
+    do
+        next = Numbered(base, ++number);
+    while (IsNameInUse(next, inUse));
+    return next;
 }
 
 } // namespace gw

@@ -91,6 +91,38 @@ TEST_F(ProfileEditor, RefusedNameGivesWayToTheOldOne)
     EXPECT_EQ(m_kEditor.FieldText(kNameField), "Mine");
 }
 
+TEST_F(ProfileEditor, OwnerHearsOfEachChangeOfTheProfileSet)
+{
+    const std::string path = MakeProfile("Mine\nA x Head 0\n");
+    const struct
+    {
+        const char* what;
+        std::function<void()> change;
+        int setChanges;
+    } rows[] = {
+        {"counting",    [&] { m_kEditor.CountMatches(path, nullptr, nullptr); }, 0},
+        {"loading",     [&] { m_kEditor.LoadProfile(path); },                    1},
+        {"marking",     [&] { m_kEditor.MarkChanged(); },                        1},
+        {"once marked", [&] { m_kEditor.MarkChanged(); },                        0},
+        {"saving",      [&] { m_kEditor.WriteProfile(EProfileWrite::Quiet); },   1},
+        {"renaming",
+         [&] {
+             m_kEditor.EditField(kNameField, "Q");
+             m_kEditor.LeaveField();
+         },                                                                      1},
+    };
+    for (const auto& row : rows)
+    {
+        m_kOwner.m_iSetChanges = 0;
+        row.change();
+        EXPECT_EQ(m_kOwner.m_iSetChanges, row.setChanges) << row.what;
+    }
+    m_kOwner.m_iStateChanges = 0;
+    m_kEditor.SelectSourceItem(0);
+    m_kEditor.Close();
+    EXPECT_EQ(m_kOwner.m_iStateChanges, 2);
+}
+
 TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
 {
     Load("N\nA x Waist 0\n");
@@ -168,6 +200,7 @@ TEST_F(ProfileEditor, RemoveDoesNotCorrectItsIndices)
     m_kEditor.ClickButton(kRemoveButton);
     EXPECT_EQ(m_kEditor.Rows().Text(0, kTargetColumn), "t1");
     EXPECT_EQ(m_kEditor.Rows().Text(1, kTargetColumn), "t2") << "selected, and spared";
+    EXPECT_TRUE(m_kEditor.Rows().IsSelected(1)) << "a selection goes with its row";
     EXPECT_EQ(m_kEditor.Rows().Text(2, kTargetColumn), "t4") << "t3 went in its place";
 
     m_kEditor.SelectOnlyRow(0);

@@ -59,6 +59,7 @@ std::string RowText(const CMapRowTable& rows, int row)
 std::vector<std::string> RowTexts(const CMapRowTable& rows)
 {
     std::vector<std::string> texts;
+    texts.reserve(size_t(rows.RowCount()));
     for (int row = 0; row < rows.RowCount(); ++row)
         texts.push_back(RowText(rows, row));
     return texts;
@@ -85,7 +86,7 @@ ProfileEditor::ProfileEditor()
 
 std::string ProfileEditor::MakeProfile(const std::string& text, const std::string& name)
 {
-    const std::string path = m_kOwner.ProfileFile(name);
+    std::string path = m_kOwner.ProfileFile(name);
     WriteBytes(path, text);
     return path;
 }

@@ -103,7 +103,7 @@ TEST_F(ProfileEditor, WrittenFileIsTheReadFileByteForByte)
 {
     const std::string text =
         "My profile\nFrameRate 90\nPosition 1 -2 3\nA <---> LowerTorso 10,-20,30,-1,3,-2\n"
-        "B <---> Head 0,0,0,1,2,3\n* Waist . .3,-2,1\n* LPelvis . .1,2,3\n* RPelvis . .1,2,3\n";
+        "B <---> Head 0,0,0,1,2,3\n* Waist . .3,-2,1\n* LPelvis . .-1,3,2\n* RPelvis . .1,2,3\n";
     Load(text);
     EXPECT_EQ(RowText(m_kEditor.Rows(), 1), "B|Head|0|0|0|||") << "the neutral triple shows nothing";
     EXPECT_TRUE(m_kEditor.WriteProfile(EProfileWrite::Quiet));
