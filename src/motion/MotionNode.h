@@ -4,6 +4,8 @@
 
 #include <cstddef>
 #include <string>
+#include <utility>
+#include <vector>
 
 namespace gw {
 
@@ -31,5 +33,26 @@ CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, f
 
 /// A new child of a node.
 CNode& AttachNode(CNode& parent);
+
+/// Makes a tree of nodes after a tree of records, root first: fill(record, node) for each that MakesNode().
+/// Files nest thousands deep, so it takes no stack for a level.
+template <class Record, class Fill>
+void BuildNodes(Record& root, CNode& rootNode, Fill fill)
+{
+    std::vector<std::pair<Record*, CNode*>> waiting{
+        {&root, &rootNode}
+    };
+    while (!waiting.empty())
+    {
+        const auto [record, node] = waiting.back();
+        waiting.pop_back();
+        fill(*record, *node);
+        for (const auto& child : record->children)
+        {
+            if (child->MakesNode())
+                waiting.emplace_back(&*child, &AttachNode(*node));
+        }
+    }
+}
 
 } // namespace gw

@@ -40,6 +40,7 @@ struct TKBVHJoint
     std::vector<Quat> rotationKeys;
     std::vector<Vec3> positionKeys; ///< offset included
 
+    bool MakesNode() const { return kind != EJointKind::EndSite; }
     TKBVHJoint& AddChild(EJointKind childKind)
     {
         children.push_back(std::make_unique<TKBVHJoint>());

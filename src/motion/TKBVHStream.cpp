@@ -140,17 +140,17 @@ bool TKBVHStream::ReadFrameTime(TKBVHFile& file)
     return m_kRecord.Fail(EFailure::BadNumber, lines.LineNumber(), Quote(number));
 }
 
-bool TKBVHStream::BuildAnimatedTree(TKBVHFile& file)
+bool TKBVHStream::BuildAnimatedTree(const TKBVHFile& file)
 {
     TKBVHJoint* const root = file.FirstRoot();
     if (!root)
         return m_kRecord.Fail(EFailure::MissingSection, lines.LineNumber(), "HIERARCHY");
     motionRoot = new CNode;
-    BuildNode(file, *root, *motionRoot);
+    BuildNodes(*root, *motionRoot, [&](TKBVHJoint& joint, CNode& node) { FillNode(file, joint, node); });
     return true;
 }
 
-void TKBVHStream::BuildNode(TKBVHFile& file, TKBVHJoint& joint, CNode& node)
+void TKBVHStream::FillNode(const TKBVHFile& file, TKBVHJoint& joint, CNode& node)
 {
     node.SetName(joint.name.c_str());
     CKeyframeControl& track =
@@ -159,11 +159,6 @@ void TKBVHStream::BuildNode(TKBVHFile& file, TKBVHJoint& joint, CNode& node)
     track.m_kPositionKeys = std::move(joint.positionKeys);
     track.m_kScaleKeys.assign(track.m_kRotationKeys.size(), kVec3One);
     AddBoneShape(file, joint, node);
-    for (const auto& child : joint.children)
-    {
-        if (child->kind == EJointKind::Joint)
-            BuildNode(file, *child, AttachNode(node));
-    }
 }
 
 void TKBVHStream::AddBoneShape(const TKBVHFile&, const TKBVHJoint& joint, CNode& node)

@@ -35,8 +35,8 @@ private:
     bool ReadKeyword(std::string_view words, std::string_view& rest);
     bool ReadNumber(std::string_view words, std::string_view& number);
 
-    bool BuildAnimatedTree(TKBVHFile& file);
-    void BuildNode(TKBVHFile& file, TKBVHJoint& joint, CNode& node);
+    bool BuildAnimatedTree(const TKBVHFile& file);
+    void FillNode(const TKBVHFile& file, TKBVHJoint& joint, CNode& node);
 };
 
 } // namespace gw

@@ -28,6 +28,8 @@ struct TKHTRSegment
     std::vector<float> scales;
 
     size_t line = 0; ///< where the hierarchy names it
+
+    bool MakesNode() const { return true; }
 };
 
 /// The parse context, with the fields of the header.

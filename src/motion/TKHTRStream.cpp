@@ -74,34 +74,34 @@ bool TKHTRStream::Load(const std::string& path)
 
 bool TKHTRStream::BuildRestTree(const TKHTRFile& file)
 {
-    const TKHTRSegment* root = file.FirstRoot();
+    TKHTRSegment* const root = file.FirstRoot();
     if (!root)
         return false;
     restRoot = new CNode;
-    BuildRestNode(file, *root, *restRoot);
+    BuildNodes(*root, *restRoot,
+               [&](TKHTRSegment& segment, CNode& node) { FillRestNode(file, segment, node); });
     return true;
 }
 
-void TKHTRStream::BuildRestNode(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
+void TKHTRStream::FillRestNode(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
 {
     node.SetName(segment.name.c_str());
     node.m_kMatrix = BaseMatrix(file, segment);
     AddBoneShape(file, segment, node);
-    for (const TKHTRSegment* child : segment.children)
-        BuildRestNode(file, *child, AttachNode(node));
 }
 
 bool TKHTRStream::BuildAnimatedTree(const TKHTRFile& file)
 {
-    TKHTRSegment* root = file.FirstRoot();
+    TKHTRSegment* const root = file.FirstRoot();
     if (!root)
         return false;
     motionRoot = new CNode;
-    BuildAnimatedNode(file, *root, *motionRoot);
+    BuildNodes(*root, *motionRoot,
+               [&](TKHTRSegment& segment, CNode& node) { FillAnimatedNode(file, segment, node); });
     return true;
 }
 
-void TKHTRStream::BuildAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node)
+void TKHTRStream::FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node)
 {
     node.SetName(segment.name.c_str());
     const float frequency = 1.0f / static_cast<float>(file.dataFrameRate);
@@ -112,8 +112,6 @@ void TKHTRStream::BuildAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment
     segment.rotations = {};
     segment.scales = {};
     AddBoneShape(file, segment, node);
-    for (TKHTRSegment* child : segment.children)
-        BuildAnimatedNode(file, *child, AttachNode(node));
 }
 
 void TKHTRStream::AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)

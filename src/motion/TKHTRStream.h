@@ -31,8 +31,8 @@ public:
 private:
     bool BuildRestTree(const TKHTRFile& file);
     bool BuildAnimatedTree(const TKHTRFile& file);
-    void BuildRestNode(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node);
-    void BuildAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node);
+    void FillRestNode(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node);
+    void FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node);
 
     bool FillHeader(TKHTRFile& file, float frameScale);
 };
