@@ -9,8 +9,8 @@ namespace gw {
 
 namespace {
 
-// Joints nearer than this part of their distance from the origin, in any unit, are at the same place:
-// rounding is a tenth of it, and the shortest bones are a thousand times longer.
+// Joints no farther apart than this, by how far from the origin they are, are at the same place: rounding is
+// a tenth of it, and the shortest bones are a thousand times longer.
 constexpr double kSamePlace = 1e-6;
 
 template <class Visit>

@@ -26,8 +26,9 @@ void CBoneMeter::Add()
     m_kTarget.Add();
     const double error = DegreesBetween(m_kSource.Direction(), m_kTarget.Direction());
     if (error > m_kErrors.Largest())
-        m_iLargestFrame = static_cast<int>(m_kErrors.Count());
+        m_iLargestFrame = m_iFrame;
     m_kErrors.Add(error);
+    ++m_iFrame;
 }
 
 void CBoneMeter::Write(BoneMeasures& bone) const

@@ -46,6 +46,7 @@ private:
     CDirectionMeter m_kSource;
     CDirectionMeter m_kTarget;
     CRunningMean m_kErrors;
+    int m_iFrame = 0; // the next one
     int m_iLargestFrame = 0;
 };
 

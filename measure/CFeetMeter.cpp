@@ -5,6 +5,8 @@
 #include "MeasureFoot.h"
 
 #include <algorithm>
+#include <cmath>
+#include <iterator>
 
 namespace gw {
 
@@ -16,8 +18,7 @@ constexpr double kSinkShare = 0.05; // what sinks deeper in fewer frames is an o
 std::vector<LegJoints> LegsOf(const std::vector<LegPair>& pairs, LegJoints LegPair::*side)
 {
     std::vector<LegJoints> legs;
-    for (const LegPair& pair : pairs)
-        legs.push_back(pair.*side);
+    std::ranges::transform(pairs, std::back_inserter(legs), side);
     return legs;
 }
 
@@ -28,6 +29,12 @@ float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLeg
     for (const CLegTrack& leg : legs)
         std::ranges::transform((leg.*joint)(), std::back_inserter(heights), &Vec3::y);
     return Percentile(std::move(heights), kFloorShare);
+}
+
+// A mapping may take a knee for its own ankle.
+bool IsLength(double leg)
+{
+    return std::isfinite(leg) && leg > 0.0;
 }
 
 // A foot without a toe joint takes its heading from the other side.
@@ -152,6 +159,8 @@ void CFeetMeter::Add()
 
 void CFeetMeter::Write(ConversionMeasures& measures, double secondsPerFrame) const
 {
+    if (!IsLength(SourceLeg()) || !IsLength(ResultLeg()))
+        return;
     const auto sourceContacts = m_kSource.Contacts(secondsPerFrame);
     const auto resultContacts = m_kResult.Contacts(secondsPerFrame);
     for (size_t i = 0; i < m_kPairs.size(); ++i)

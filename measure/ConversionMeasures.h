@@ -107,7 +107,7 @@ struct ConversionMeasures
 
     /// Where the result stands, against y = 0, mm: the median of a sole's height over the frames of the
     /// result's contacts, missing where it never stands. A sole is what lies on the floor under ankle and toe
-    /// in the rest pose, and its height is that of its lower end.
+    /// in the rest pose (RestFloor), and its height is that of its lower end.
     std::optional<double> floorHeight;
     /// 95th percentile over all frames of the depth of the lowest sole below y = 0, mm; 0 where it is not
     /// below.

@@ -8,6 +8,7 @@ namespace gw {
 
 float Percentile(std::vector<float> values, double share)
 {
+    std::erase_if(values, [](float value) { return !std::isfinite(value); });
     if (values.empty())
         return 0.0f;
     const auto last = static_cast<double>(values.size() - 1);

@@ -3,18 +3,22 @@
 #include "Vec3.h"
 
 #include <algorithm>
+#include <cmath>
 #include <cstddef>
 #include <optional>
 #include <vector>
 
 namespace gw {
 
-/// Mean and largest value of numbers that come one by one. Both are 0 where none came.
+/// Mean and largest value of numbers that come one by one. Both are 0 where none came. What is no finite
+/// number, as positions near the end of 32 bits give, is passed over.
 class CRunningMean
 {
 public:
     void Add(double value)
     {
+        if (!std::isfinite(value))
+            return;
         m_fLargest = m_uiCount == 0 ? value : std::max(m_fLargest, value);
         m_fSum += value;
         ++m_uiCount;
@@ -37,7 +41,8 @@ inline std::optional<double> RatioOf(double result, double source, double least 
     return source > least ? std::optional(result / source) : std::nullopt;
 }
 
-/// The value below which a share (0 to 1) of the values lies, by the nearest rank; 0 without values.
+/// The value below which a share (0 to 1) of the values lies, by the nearest rank; 0 without values. Numbers
+/// that are not finite do not count.
 float Percentile(std::vector<float> values, double share);
 
 /// The angle between two directions in degrees, exact for small angles too; 0 where one has no length.

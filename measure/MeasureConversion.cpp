@@ -35,8 +35,11 @@ public:
             return;
         const Vec3 source = m_pkSource->m_kWorldMatrix.Translation();
         const Vec3 result = m_pkResult->m_kWorldMatrix.Translation();
-        m_fSourcePath += m_bBegun ? GroundDistance(m_kLastSource, source) : 0.0;
-        m_fResultPath += m_bBegun ? GroundDistance(m_kLastResult, result) : 0.0;
+        if (m_bBegun)
+        {
+            m_kSourceSteps.Add(GroundDistance(m_kLastSource, source));
+            m_kResultSteps.Add(GroundDistance(m_kLastResult, result));
+        }
         m_kLastSource = source;
         m_kLastResult = result;
         m_bBegun = true;
@@ -45,8 +48,8 @@ public:
     {
         if (measures.sourceLeg <= 0.0 || measures.resultLeg <= 0.0)
             return;
-        measures.sourceTravel = m_fSourcePath / measures.sourceLeg;
-        measures.resultTravel = m_fResultPath / measures.resultLeg;
+        measures.sourceTravel = m_kSourceSteps.Sum() / measures.sourceLeg;
+        measures.resultTravel = m_kResultSteps.Sum() / measures.resultLeg;
         measures.travelRatio = RatioOf(measures.resultTravel, measures.sourceTravel, kStillTravel);
     }
 
@@ -55,8 +58,8 @@ private:
     const CNode* m_pkResult;
     Vec3 m_kLastSource = kVec3Zero;
     Vec3 m_kLastResult = kVec3Zero;
-    double m_fSourcePath = 0.0;
-    double m_fResultPath = 0.0;
+    CRunningMean m_kSourceSteps;
+    CRunningMean m_kResultSteps;
     bool m_bBegun = false;
 };
 

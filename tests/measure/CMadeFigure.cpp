@@ -4,6 +4,9 @@
 #include "CKeyframeControl.h"
 #include "Skeleton.h"
 
+#include <cmath>
+#include <gtest/gtest.h>
+
 namespace gw {
 
 namespace {
@@ -122,6 +125,11 @@ MotionClip CMadeFigure::Record(int frameCount, const std::function<void(CMadeFig
         TrackOf(*bone).m_fEndTime = static_cast<float>(frameCount - 1);
     }
     return {m_spkRoot.Get(), frequency, frameCount};
+}
+
+void ExpectMeasured(double figure, double putIn)
+{
+    EXPECT_NEAR(figure, putIn, putIn == 0.0 ? 1e-3 : std::fabs(putIn) * 0.01);
 }
 
 std::vector<BonePair> PairByName(const CMadeFigure& source, const CMadeFigure& result)

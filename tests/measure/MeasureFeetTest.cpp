@@ -12,7 +12,6 @@ namespace gw {
 
 namespace {
 
-constexpr double kOnePercent = 0.01;
 constexpr int kFrames = 120;
 constexpr int kPeriod = 40; // frames of a step: the foot stands for 24 and swings for 16
 constexpr int kStand = 24;
@@ -76,7 +75,7 @@ TEST(MeasureFeet, ContactsAreTheFramesThatStand)
     const ConversionMeasures early = MeasureWalks({}, {.early = 8});
     const double standing = kStand;
     const double expected = 2.0 * (standing - 8.0) / (standing + standing - 8.0);
-    EXPECT_NEAR(early.contactF1.value_or(0.0), expected, expected * kOnePercent);
+    ExpectMeasured(early.contactF1.value_or(0.0), expected);
     EXPECT_EQ(early.feet[0].bothStanding, 3u * (kStand - 8));
 }
 
@@ -114,11 +113,10 @@ TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
         const double added = row.resultDrift - row.sourceDrift;
         for (const FootMeasures& foot : walks.feet)
         {
-            EXPECT_NEAR(foot.addedSlideMean, added, std::fabs(added) * kOnePercent);
-            EXPECT_NEAR(foot.addedSlideLargest, added, std::fabs(added) * kOnePercent);
-            EXPECT_NEAR(foot.addedSlideMeanShare, added / 800.0, std::fabs(added) / 800.0 * kOnePercent);
-            EXPECT_NEAR(foot.sourceSlideShare, row.sourceDrift / 800.0,
-                        row.sourceDrift / 800.0 * kOnePercent + 1e-6);
+            ExpectMeasured(foot.addedSlideMean, added);
+            ExpectMeasured(foot.addedSlideLargest, added);
+            ExpectMeasured(foot.addedSlideMeanShare, added / 800.0);
+            ExpectMeasured(foot.sourceSlideShare, row.sourceDrift / 800.0);
         }
     }
 }
@@ -126,22 +124,22 @@ TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
 TEST(MeasureFeet, SoleStandsAndSinksByItsDepth)
 {
     const ConversionMeasures sunk = MeasureWalks({}, {.sink = 12.0});
-    EXPECT_NEAR(sunk.sinkDepth, 12.0, 12.0 * kOnePercent);
-    EXPECT_NEAR(sunk.floorHeight.value_or(0.0), -12.0, 12.0 * kOnePercent);
+    ExpectMeasured(sunk.sinkDepth, 12.0);
+    ExpectMeasured(sunk.floorHeight.value_or(0.0), -12.0);
     EXPECT_DOUBLE_EQ(sunk.contactF1.value_or(0.0), 1.0) << "the floor of a clip is its own";
 
     const ConversionMeasures floating = MeasureWalks({}, {.sink = -9.0});
-    EXPECT_NEAR(floating.floorHeight.value_or(0.0), 9.0, 9.0 * kOnePercent);
+    ExpectMeasured(floating.floorHeight.value_or(0.0), 9.0);
     EXPECT_EQ(floating.sinkDepth, 0.0);
 
     // A toe that dips: 150 mm in front of the ankle, 100 mm of it under the joint.
     const ConversionMeasures tilted = MeasureWalks({}, {.tilt = 5.0});
     const double angle = 5.0 * kDegreesToRadians64;
     const double dip = 150.0 * std::sin(angle) - 100.0 * (1.0 - std::cos(angle));
-    EXPECT_NEAR(tilted.sinkDepth, dip, dip * kOnePercent);
-    EXPECT_NEAR(tilted.feet[0].soleTiltMean, 5.0, 5.0 * kOnePercent);
-    EXPECT_NEAR(tilted.feet[0].soleTiltLargest, 5.0, 5.0 * kOnePercent);
-    EXPECT_NEAR(tilted.feet[0].sourceSoleTiltMean, 0.0, 0.05);
+    ExpectMeasured(tilted.sinkDepth, dip);
+    ExpectMeasured(tilted.feet[0].soleTiltMean, 5.0);
+    ExpectMeasured(tilted.feet[0].soleTiltLargest, 5.0);
+    ExpectMeasured(tilted.feet[0].sourceSoleTiltMean, 0.0);
 }
 
 TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
@@ -165,10 +163,10 @@ TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
             MeasureWalks({.turn = row.sourceTurn}, {.turn = row.resultTurn}, 0.01);
         for (const FootMeasures& foot : walks.feet)
         {
-            EXPECT_NEAR(foot.turnMean, row.expected, 11.0 * kOnePercent);
-            EXPECT_NEAR(foot.turnError, 11.0, 11.0 * kOnePercent);
-            EXPECT_NEAR(foot.turnLargest, 11.0, 11.0 * kOnePercent);
-            EXPECT_NEAR(foot.turnWhileStanding, 11.0, 11.0 * kOnePercent);
+            ExpectMeasured(foot.turnMean, row.expected);
+            ExpectMeasured(foot.turnError, 11.0);
+            ExpectMeasured(foot.turnLargest, 11.0);
+            ExpectMeasured(foot.turnWhileStanding, 11.0);
             EXPECT_FALSE(foot.turnFromStart);
         }
     }
@@ -190,7 +188,7 @@ TEST(MeasureFeet, FootWithoutToeTurnsFromItsStart)
     const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
     ASSERT_EQ(measures.feet.size(), 2u);
     EXPECT_TRUE(measures.feet[0].turnFromStart);
-    EXPECT_NEAR(measures.feet[0].turnMean, 11.0, 11.0 * kOnePercent);
+    ExpectMeasured(measures.feet[0].turnMean, 11.0);
     EXPECT_FALSE(measures.feet[1].turnFromStart);
 }
 
@@ -210,9 +208,9 @@ TEST(MeasureFeet, KneePopIsAChangeThatTheSourceHasNot)
     const FootMeasures& left = measures.feet[0];
     // From 46 to 55 where the source goes from 46 to 30, and from 55 to 34 where it goes from 30 to 34.
     EXPECT_EQ(left.kneePops, 1u);
-    EXPECT_NEAR(left.kneePopLargest, 17.0, 17.0 * kOnePercent);
-    EXPECT_NEAR(left.kneeChangeLargest, 21.0, 21.0 * kOnePercent);
-    EXPECT_NEAR(left.sourceKneeChangeLargest, 16.0, 16.0 * kOnePercent);
+    ExpectMeasured(left.kneePopLargest, 17.0);
+    ExpectMeasured(left.kneeChangeLargest, 21.0);
+    ExpectMeasured(left.sourceKneeChangeLargest, 16.0);
     EXPECT_EQ(measures.feet[1].kneePops, 0u);
 }
 
