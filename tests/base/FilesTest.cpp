@@ -215,9 +215,11 @@ TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)
     const CTempFolder folder;
     const std::string path = folder.Path("a.htr");
     WriteBytes(path, "old");
-    fs::permissions(path, fs::perms(0640));
+    fs::permissions(path, fs::perms(0660)); // which the user's mask would cut
     CSafeFile file;
+    const mode_t mask = umask(022);
     ASSERT_TRUE(file.Open(path));
+    umask(mask);
     EXPECT_EQ(ModeOf(file.PrivatePath()) & 07, 0u); // not laid open meanwhile
     EXPECT_TRUE(file.Write("new "));
     const std::byte bytes[] = {std::byte{'0'}, std::byte{0}};
@@ -227,7 +229,7 @@ TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)
     EXPECT_TRUE(file.Commit());
     EXPECT_FALSE(file.Commit());
     EXPECT_EQ(ReadBytes(path), std::string("new 0\0", 6));
-    EXPECT_EQ(ModeOf(path), 0640u);
+    EXPECT_EQ(ModeOf(path), 0660u);
     EXPECT_EQ(EntryCount(folder), 1u);
 }
 

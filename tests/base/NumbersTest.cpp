@@ -114,6 +114,7 @@ TEST(Numbers, OddTextsHaveTheirValueAndTheirKind)
         {"another number stuck to it",    "0.0-7.5",                      0.0f,        ENumber::Stuck,   true },
         {"decimal comma and more",        "1,5x",                         1.0f,        ENumber::Stuck,   true },
         {"more digits than 64 bits hold", "1.00000000000000000000001",    1.0f,        ENumber::Whole,   true },
+        {"digits that wrap to 1",         "18446744073709551617",         0x1p64f,     ENumber::Whole,   true },
         {"narrowed from 64 bits",         "1.00000017881393432617187499", 1.0000002f,  ENumber::Whole,   true },
         {"hexadecimal, two signs",        "0x7p+-1",                      7.0f,        ENumber::Stuck,   true },
         {"hexadecimal of a sign",         "0x-5",                         0.0f,        ENumber::Stuck,   false},
@@ -141,8 +142,10 @@ TEST(Numbers, OddTextsHaveTheirValueAndTheirKind)
         EXPECT_EQ(ScanFloat(block.Text(), scanned, kind), row.scanned);
         EXPECT_TRUE(IsSame(scanned, row.scanned ? row.value : kUntouched)) << scanned;
         EXPECT_EQ(kind, row.scanned ? row.kind : ENumber::None);
+        const CRead read = ReadFront(block);
+        EXPECT_TRUE(IsSame(read.value, row.scanned ? row.value : 0.0f)) << read.value;
         const bool isCutByComma = row.text.find(',') != row.text.npos;
-        EXPECT_EQ(ReadFront(block).kind, isCutByComma ? ENumber::Whole : kind);
+        EXPECT_EQ(read.kind, isCutByComma ? ENumber::Whole : kind);
     }
     ENumber kind;
     EXPECT_EQ(ParseDouble("1e39", kind), 1e39);

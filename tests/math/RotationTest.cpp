@@ -118,12 +118,12 @@ TEST(Euler, QuarterTurnsOfTheMiddleAngle)
         const Mat3 m = About(row.axes[0], row.first) * About(row.axes[1], row.second);
         ExpectNear(ToEulerDegrees(m, row.order), row.degrees, 1e-3);
     }
-    // A quarter turn of the angle from which the last one is derived.
-    for (const int order : {4, 5})
-    {
-        const Vec3 degrees{20.0f, 30.0f, 90.0f};
-        ExpectNear(ToEulerDegrees(EulerToMat3(kOrderNames[order], degrees), order), degrees, 1e-3);
-    }
+    // A quarter turn of the angle from which X is derived, to the last bit.
+    const Mat3 quarter = Mat3FromAxisAngle(kVec3UnitZ, kHalfPi);
+    ExpectNear(ToEulerDegrees(About('Y', 30.0f) * About('X', 20.0f) * quarter, 4), {20.0f, 30.0f, 90.0f},
+               1e-3);
+    ExpectNear(ToEulerDegrees(quarter * About('X', 20.0f) * About('Y', 30.0f), 5), {20.0f, 30.0f, 90.0f},
+               1e-3);
 }
 
 TEST(Euler, DegreesRebuildAWholeTurnAndAreNeverNaN)
@@ -169,11 +169,16 @@ TEST(Quat, MatricesComeBackAlsoFromHalfTurns)
 {
     const float r = std::sqrt(0.5f);
     const float s = std::sqrt(1.0f / 3.0f);
+    // Of the last one only the largest element gives all digits.
     const Vec3 axes[] = {
-        kVec3UnitX, kVec3UnitY, kVec3UnitZ, {r,    r,    0.0f},
-           {0.0f, -r,   r   },
-           {r,    0.0f, -r  },
-           {s,    s,    -s  }
+        {1.0f, 0.0f,       0.0f  },
+        {0.0f, 1.0f,       0.0f  },
+        {0.0f, 0.0f,       1.0f  },
+        {r,    r,          0.0f  },
+        {0.0f, -r,         r     },
+        {r,    0.0f,       -r    },
+        {s,    s,          -s    },
+        {0.0f, 0.9999995f, 0.001f},
     };
     for (const Vec3& axis : axes)
     {
