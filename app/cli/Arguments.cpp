@@ -165,10 +165,10 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
         return RefuseUnknown(command, *option);
     if (!wrong.empty())
         return RefuseFor(command, Printable(wrong));
-    if (options.files.size() < command.leastOperands)
+    if (options.files.size() < LeastOperands(command))
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
-    if (options.files.size() > command.mostOperands)
-        return RefuseFor(command, "one argument too many: " + Quoted(options.files[command.mostOperands]));
+    if (options.files.size() > MostOperands(command))
+        return RefuseFor(command, "one argument too many: " + Quoted(options.files[MostOperands(command)]));
     return std::nullopt;
 }
 

@@ -21,6 +21,7 @@ constexpr int kStock = 1; // user data of a list entry
 std::vector<std::string> NamesOf(const std::vector<CInstalledProfile>& profiles)
 {
     std::vector<std::string> names;
+    names.reserve(profiles.size());
     for (const CInstalledProfile& profile : profiles)
         names.push_back(profile.name);
     return names;
@@ -66,7 +67,7 @@ std::vector<CInstalledProfile> CShellContent::InstalledProfiles()
 
 std::string CShellContent::ResolveProfile(const std::string& nameOrFile)
 {
-    const std::string installed = FindProfilePath(nameOrFile);
+    std::string installed = FindProfilePath(nameOrFile);
     if (!installed.empty())
         return installed;
     std::string text;

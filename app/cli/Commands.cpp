@@ -1,40 +1,71 @@
 #include "Commands.h"
 
+#include <algorithm>
+
 namespace gw {
 
 namespace {
 
-constexpr size_t kAny = SIZE_MAX;
+// Rows are calls, which the formatter leaves as they are read.
+constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_t options, uint32_t required,
+                       EExit (*run)(const COptions&), std::string_view help, std::string_view example)
+{
+    return {name, operands, options, required, run, help, example};
+}
+
+constexpr uint32_t kConvertOptions =
+    kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting | kDryRun | kKeepGoing;
 
 constexpr CCommand kCommands[] = {
-    {"convert",   "SOURCE...",     1, kAny,
-     kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting | kDryRun | kKeepGoing, 0,
-     "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
-     "Without --profile the stock profile that fits is taken, else the installed one that fits best.\n"
-     "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.",                                                                        "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\"", RunConvert    },
-    {"batch",     "FOLDER",        1, 1,    kJob | kProfile,                                       kJob,
-     "Convert every .bvh of a folder to an .htr beside it, or package every .htr as an .orn.\n"
-     "Files that exist are replaced; the first failure ends the run.",                                                                                                      "gaitwright batch takes --job htr --profile \"Poser BVH\"",            RunBatchFolder},
-    {"info",      "FILE",          1, 1,    0,                                                     0,
-     "Show what a motion or a container holds: format, frames, rate, bones, objects.",                                                                                      "gaitwright info walk.bvh",                                            RunInfo       },
-    {"pose",      "FILE",          1, 1,    kFrame,                                                kFrame,
-     "Print the local and world matrix of every node at a frame, as JSON.\n"
-     "Row vectors, row by row. A frame behind the end gives the pose of the end.",                                                                                          "gaitwright pose walk.bvh --frame 30",                                 RunPose       },
-    {"transcode", "IN OUT",        2, 2,    kFrameScale | kForce,                                  0,
-     "Write a motion in another form: an .htr as an .htr with more or fewer frames, any motion as a .bvh.",                                                                 "gaitwright transcode walk.htr slow.htr --frame-scale 2",              RunTranscode  },
-    {"resave",    "IN OUT",        2, 2,    kForce,                                                0,        "Read a container and write it again, in the newest version.",
-     "gaitwright resave old.orn new.orn",                                                                                                                                                                                                          RunResave     },
-    {"extract",   "FILE",          1, 1,    kOutput | kForce,                                      kOutput,  "Take the motion file out of a Kinetra file.",
-     "gaitwright extract walk.Kinetra -o walk.htr",                                                                                                                                                                                                RunExtract    },
-    {"package",   "IN OUT",        2, 2,    kRate | kForce,                                        kRate,    "Wrap a motion file into a Kinetra file.",
-     "gaitwright package walk.htr walk.Kinetra --rate 30",                                                                                                                                                                                         RunPackage    },
-    {"profiles",  "[SOURCE]",      0, 1,    0,                                                     0,
-     "List the installed profiles; with a source, which of them fit, and what the others miss.",                                                                            "gaitwright profiles walk.bvh",                                        RunProfiles   },
-    {"compare",   "SOURCE RESULT", 2, 2,    kProfile,                                              kProfile,
-     "Measure a conversion: how far the result's bones, feet and path differ from the source's.",                                                                           "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\"",        RunCompare    },
+    Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
+        "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
+        "Without --profile the stock profile that fits is taken, else the installed one that fits best.\n"
+        "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.",
+        "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
+    Row("batch", "FOLDER", kJob | kProfile, kJob, RunBatchFolder,
+        "Convert every .bvh of a folder to an .htr beside it, or package every .htr.\n"
+        "Packages are written as .orn. Files that exist are replaced; the first failure ends the run.",
+        "gaitwright batch takes --job htr --profile \"Poser BVH\""),
+    Row("info", "FILE", 0, 0, RunInfo,
+        "Show what a motion or a container holds: format, frames, rate, bones, objects.",
+        "gaitwright info walk.bvh"),
+    Row("pose", "FILE", kFrame, kFrame, RunPose,
+        "Print the local and world matrix of every node at a frame, as JSON.\n"
+        "Row vectors, row by row. A frame behind the end gives the pose of the end.",
+        "gaitwright pose walk.bvh --frame 30"),
+    Row("transcode", "IN OUT", kFrameScale | kForce, 0, RunTranscode,
+        "Write an .htr with more or fewer frames, or any motion as a .bvh.",
+        "gaitwright transcode walk.htr slow.htr --frame-scale 2"),
+    Row("resave", "IN OUT", kForce, 0, RunResave,
+        "Read a container and write it again, in the newest version.", "gaitwright resave old.orn new.orn"),
+    Row("extract", "FILE", kOutput | kForce, kOutput, RunExtract,
+        "Take the motion file out of a Kinetra file.", "gaitwright extract walk.Kinetra -o walk.htr"),
+    Row("package", "IN OUT", kRate | kForce, kRate, RunPackage, "Wrap a motion file into a Kinetra file.",
+        "gaitwright package walk.htr walk.Kinetra --rate 30"),
+    Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
+        "List the installed profiles; with a source, which fit and what the others miss.",
+        "gaitwright profiles walk.bvh"),
+    Row("compare", "SOURCE RESULT", kProfile, kProfile, RunCompare,
+        "Measure a conversion: how far the result's bones, feet and path differ.",
+        "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),
 };
 
+size_t CountWords(std::string_view text)
+{
+    return static_cast<size_t>(std::ranges::count(text, ' ')) + 1;
+}
+
 } // namespace
+
+size_t LeastOperands(const CCommand& command)
+{
+    return command.operands.starts_with('[') ? 0 : CountWords(command.operands);
+}
+
+size_t MostOperands(const CCommand& command)
+{
+    return command.operands.ends_with("...") ? SIZE_MAX : CountWords(command.operands);
+}
 
 std::span<const CCommand> Commands()
 {

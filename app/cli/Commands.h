@@ -32,15 +32,17 @@ enum EOption : uint32_t
 struct CCommand
 {
     std::string_view name;
-    std::string_view operands; ///< as the usage line shows them
-    size_t leastOperands;
-    size_t mostOperands;
-    uint32_t options;  ///< bits of EOption beside those that every command takes
-    uint32_t required; ///< which of them must be there
-    std::string_view help;
-    std::string_view example;
+    std::string_view operands; ///< as the usage line shows them: "IN OUT", "[SOURCE]", "SOURCE..."
+    uint32_t options;          ///< bits of EOption beside those that every command takes
+    uint32_t required;         ///< which of them must be there
     EExit (*run)(const COptions& options);
+    std::string_view help; ///< the first line stands in the list of commands
+    std::string_view example;
 };
+
+/// How many operands a command takes.
+size_t LeastOperands(const CCommand& command);
+size_t MostOperands(const CCommand& command);
 
 /// The table of commands, in the order of the help.
 std::span<const CCommand> Commands();

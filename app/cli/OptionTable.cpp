@@ -1,32 +1,38 @@
 #include "OptionTable.h"
 
-#include <algorithm>
-
 namespace gw {
 
 namespace {
 
 constexpr uint32_t kEverywhere = kDataFolder | kJson | kQuiet;
 
+constexpr COptionRow Row(EOption bit, std::string_view names, std::string_view value, COptionTarget target,
+                         std::string_view help, std::string_view choices = {})
+{
+    return {bit, names, value, target, help, choices};
+}
+
 constexpr COptionRow kOptions[] = {
-    {kOutput,       "-o,--output", "OUT",            "the file to write",                                            &COptions::output},
-    {kOutputFolder, "--out-dir",   "DIR",            "the folder to write to, made where it is missing",
-     &COptions::outputFolder                                                                                                          },
-    {kProfile,      "--profile",   "NAME|FILE",      "an installed profile by its name, or the path of a .prf file",
-     &COptions::profile                                                                                                               },
-    {kJob,          "--job",       "htr|orn",        "htr converts every .bvh, orn packages every .htr",             &COptions::job,    "htr|orn"},
-    {kFrame,             "--frame",                     "N",                "the number of the frame, from 0 on",                                                       &COptions::frame                    },
-    {kRate,             "--rate",                      "R",                  "frames per second, as the package tells its reader",                                                        &COptions::rate},
-    {kFrameScale,             "--frame-scale",                "F",     "F times as many frames in the same time",                                                 &COptions::frameScale                                     },
-    {kNoLegs,             "--no-legs",                    "",             "do not plant the feet where the source's stand",                                                      &COptions::noLegs},
-    {kForce,             "--force",                     "",                "replace a file that exists",                                                        &COptions::force                                                        },
-    {kSkipExisting,             "--skip-existing",              "", "pass over a source whose output exists",                                                &COptions::skipExisting},
-    {kKeepGoing,             "--keep-going",                 "",       "go on with the next source where one fails",                                                   &COptions::keepGoing                                                 },
-    {kDryRun,             "--dry-run",                    "",             "say what would be done, and write nothing",                                                      &COptions::dryRun},
-    {kDataFolder,             "--data-dir",                "DIR",
-     "the folder of base.htr, KsBone.bsm and the stock profiles, in place of the program's own",                                                  &COptions::dataFolder                                       },
-    {kJson,             "--json",                      "",                  "results as JSON",                                                         &COptions::json},
-    {kQuiet,             "--quiet",                     "",                "no words but those of failures",                                                        &COptions::quiet                         },
+    Row(kOutput, "-o,--output", "OUT", &COptions::output, "the file to write"),
+    Row(kOutputFolder, "--out-dir", "DIR", &COptions::outputFolder,
+        "the folder to write to, made where it is missing"),
+    Row(kProfile, "--profile", "NAME|FILE", &COptions::profile,
+        "an installed profile, or the path of a .prf file"),
+    Row(kJob, "--job", "htr|orn", &COptions::job, "htr converts every .bvh, orn packages every .htr",
+        "htr|orn"),
+    Row(kFrame, "--frame", "N", &COptions::frame, "the number of the frame, from 0 on"),
+    Row(kRate, "--rate", "R", &COptions::rate, "frames per second, as the package tells its reader"),
+    Row(kFrameScale, "--frame-scale", "F", &COptions::frameScale, "F times as many frames in the same time"),
+    Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's stand"),
+    Row(kForce, "--force", "", &COptions::force, "replace a file that exists"),
+    Row(kSkipExisting, "--skip-existing", "", &COptions::skipExisting,
+        "pass over a source whose output exists"),
+    Row(kKeepGoing, "--keep-going", "", &COptions::keepGoing, "go on with the next source where one fails"),
+    Row(kDryRun, "--dry-run", "", &COptions::dryRun, "say what would be done, and write nothing"),
+    Row(kDataFolder, "--data-dir", "DIR", &COptions::dataFolder,
+        "the folder of base.htr, KsBone.bsm and the stock profiles, in place of the program's own"),
+    Row(kJson, "--json", "", &COptions::json, "results as JSON"),
+    Row(kQuiet, "--quiet", "", &COptions::quiet, "no words but those of failures"),
 };
 
 constexpr size_t kColumn = 26; // where the second column of a help begins

@@ -17,10 +17,9 @@ struct COptionRow
     EOption bit;
     std::string_view names; ///< "-o,--output"
     std::string_view value; ///< what stands behind it, as the help shows it; empty for a switch
-    std::string_view help;
     COptionTarget target;
-    std::string_view choices =
-        {}; ///< the words that may stand behind it, with "|" between them; empty for any
+    std::string_view help;
+    std::string_view choices; ///< the words that may stand behind it, with "|" between them; empty for any
 };
 
 /// The table of options, in the order of the help.
