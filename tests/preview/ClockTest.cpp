@@ -1,0 +1,159 @@
+// The playback clock: where it stands after each operation, what it evaluates and which scene it keeps.
+
+#include "PreviewScene.h"
+
+#include <gtest/gtest.h>
+
+namespace gw {
+namespace {
+
+constexpr float kStep = 0.5f;
+constexpr float kLastFrame = 4.0f; // so that the end is at 2
+
+using View = CGLView;
+using Operations = std::vector<void (View::*)()>;
+
+// All operations of the clock that may move something.
+void OperateAll(View& view)
+{
+    view.Play();
+    view.Advance();
+    view.StepForward();
+    view.Seek(1, 2);
+    view.SeekEnd();
+    view.StepBack();
+    view.Stop();
+}
+
+void ExpectStand(int eighth, const Operations& operations, float time, bool plays)
+{
+    const Ref<CNode> scene = MakeScene({});
+    const CTimeKeeper& keeper = AttachKeeper(*scene);
+    CCountedView view;
+    view.SetScene(scene.Get(), kStep, kLastFrame);
+    EXPECT_TRUE(keeper.m_kTimes.empty()) << "a new scene is shown as it stands";
+    view.Seek(eighth, 8);
+    for (const auto operation : operations)
+        (view.*operation)();
+    EXPECT_EQ(view.GetTime(), time);
+    EXPECT_EQ(view.IsPlaying(), plays);
+    EXPECT_EQ(keeper.m_kTimes.back(), time) << "what is shown is where the clock stands";
+    EXPECT_EQ(view.m_iRepaints, 1 + static_cast<int>(keeper.m_kTimes.size()));
+}
+
+// From an eighth of the motion on, which is half a frame.
+TEST(Clock, StandsWhereEachOperationLeavesIt)
+{
+    const struct
+    {
+        const char* what;
+        int eighth;
+        Operations operations;
+        float time;
+        bool plays;
+    } rows[] = {
+        {"a place on the scroll bar",            2, {},                                         0.5f, false},
+        {"a place past its end",                 9, {},                                         2.0f, false},
+        {"a step on",                            2, {&View::StepForward},                       1.0f, false},
+        {"a step back",                          4, {&View::StepBack},                          0.5f, false},
+        {"from between two frames to the end",   7, {&View::StepForward},                       2.0f, false},
+        {"from between two frames to the start", 1, {&View::StepBack},                          0.0f, false},
+        {"no step past the end",                 3, {&View::SeekEnd, &View::StepForward},       2.0f, false},
+        {"no step before the start",             3, {&View::SeekStart, &View::StepBack},        0.0f, false},
+        {"a tick while stopped",                 2, {&View::Advance},                           0.5f, false},
+        {"a tick while playing",                 2, {&View::Play, &View::Advance},              1.0f, true },
+        {"a tick that reaches the end",          6, {&View::Play, &View::Advance},              0.0f, false},
+        {"a tick that passes the end",           7, {&View::Play, &View::Advance},              0.0f, false},
+        {"a tick at the end",                    8, {&View::Play, &View::Advance},              0.0f, false},
+        {"a step while playing",                 2, {&View::Play, &View::StepForward},          1.0f, true },
+        {"a tick after stopping",                2, {&View::Play, &View::Stop, &View::Advance}, 0.5f, false},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        ExpectStand(row.eighth, row.operations, row.time, row.plays);
+    }
+}
+
+TEST(Clock, PlaysEachFrameOnceAndStops)
+{
+    const Ref<CNode> scene = MakeScene({});
+    const CTimeKeeper& keeper = AttachKeeper(*scene);
+    CGLView view;
+    view.SetScene(scene.Get(), kStep, kLastFrame);
+    view.Play();
+    for (int tick = 0; tick < 10; ++tick)
+        view.Advance();
+    EXPECT_EQ(keeper.m_kTimes, (std::vector<float>{0.5f, 1.0f, 1.5f, 0.0f}));
+}
+
+TEST(Clock, ScrollBarWithoutARangeIsNoPlace)
+{
+    const Ref<CNode> scene = MakeScene({});
+    CGLView view;
+    view.SetScene(scene.Get(), kStep, kLastFrame);
+    view.Seek(1, 2);
+    view.Seek(0, 0);
+    EXPECT_EQ(view.GetTime(), 1.0f);
+}
+
+TEST(Clock, MotionOfOneFrameStaysAtZero)
+{
+    const Ref<CNode> scene = MakeScene({});
+    CGLView view;
+    view.SetScene(scene.Get(), kStep, 0.0f);
+    OperateAll(view);
+    EXPECT_EQ(view.GetTime(), 0.0f);
+    view.Play();
+    view.Advance();
+    EXPECT_EQ(view.GetTime(), 0.0f);
+    EXPECT_FALSE(view.IsPlaying());
+}
+
+TEST(Clock, NothingMovesWithoutAScene)
+{
+    CCountedView view;
+    view.SetScene(nullptr, kStep, kLastFrame);
+    view.Play();
+    EXPECT_FALSE(view.IsPlaying());
+    OperateAll(view);
+    EXPECT_EQ(view.GetTime(), 0.0f);
+    EXPECT_EQ(view.m_iRepaints, 1) << "only the empty view is shown";
+}
+
+TEST(Scene, LivesAsLongAsItIsShown)
+{
+    CGLView view;
+    CNode* const scene = new CNode;
+    Watch<CNode> watch;
+    watch.Set(scene);
+    Watch<CTriMesh> mesh;
+    mesh.Set(&AttachBone(*scene, "bone", 1));
+    view.SetScene(scene, kStep, kLastFrame);
+    view.SetScene(scene, kStep, kLastFrame);
+    ASSERT_TRUE(watch) << "the view alone keeps it, also when it is given again";
+    EXPECT_FALSE(view.DrawScene().Ends().empty());
+    view.SetScene(nullptr, 0.0f, 0.0f);
+    EXPECT_FALSE(watch);
+    EXPECT_FALSE(mesh) << "what was drawn is not kept either";
+    EXPECT_TRUE(view.DrawScene().Ends().empty());
+}
+
+TEST(Scene, AnotherOneStopsTheClock)
+{
+    CGLView view;
+    view.SetScene(MakeScene({}).Get(), kStep, kLastFrame);
+    for (const Ref<CNode>& next : {MakeScene({}), Ref<CNode>()})
+    {
+        view.Play();
+        view.Advance();
+        view.SetScene(next.Get(), 0.25f, 7.0f);
+        EXPECT_FALSE(view.IsPlaying());
+        EXPECT_EQ(view.GetTime(), 0.0f);
+        EXPECT_EQ(view.GetFrameStep(), 0.25f);
+        EXPECT_EQ(view.GetLastFrame(), 7.0f);
+    }
+}
+
+} // namespace
+} // namespace gw

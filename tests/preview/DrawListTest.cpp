@@ -1,0 +1,173 @@
+// The lines that a scene is drawn as.
+
+#include "PreviewScene.h"
+
+#include <gtest/gtest.h>
+
+namespace gw {
+namespace {
+
+constexpr size_t kAxisEnds = 6;
+
+// The lines of a scene without any evaluation.
+std::vector<LineEnd> LinesOf(CNode& scene, const char* highlight = "")
+{
+    CGLView view;
+    view.SetScene(&scene, 1.0f, 1.0f);
+    view.SetHighlight(highlight);
+    const std::span<const LineEnd> ends = view.DrawScene().Ends();
+    return {ends.begin(), ends.end()};
+}
+
+void ExpectLine(const std::vector<LineEnd>& lines, size_t first, const Vec3& from, const Vec3& to,
+                LineColor color)
+{
+    ASSERT_LE(first + 2, lines.size());
+    EXPECT_EQ(lines[first].point, from);
+    EXPECT_EQ(lines[first + 1].point, to);
+    EXPECT_EQ(lines[first].color, color);
+    EXPECT_EQ(lines[first + 1].color, color);
+}
+
+TEST(DrawList, LastSixthOfTheTrianglesIsLeftOut)
+{
+    const struct
+    {
+        int32_t triangles;
+        size_t drawn;
+    } rows[] = {
+        {0,  0 },
+        {1,  1 },
+        {2,  2 },
+        {3,  3 },
+        {4,  4 },
+        {5,  4 },
+        {6,  5 },
+        {8,  7 },
+        {12, 10},
+        {72, 60},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.triangles);
+        const Ref<CNode> scene = MakeScene({});
+        AttachBone(*scene, "bone", row.triangles);
+        scene->UpdateScene(0.0f, true);
+        const std::vector<LineEnd> lines = LinesOf(*scene);
+        EXPECT_EQ(lines.size(), kAxisEnds + 6 * row.drawn);
+        if (row.drawn > 0)
+        {
+            EXPECT_EQ(lines.back().point.z, static_cast<float>(row.drawn - 1)) << "the first ones are drawn";
+        }
+    }
+}
+
+TEST(DrawList, TriangleIsAClosedOutlineInTheWorld)
+{
+    const Ref<CNode> scene = MakeScene({});
+    AttachBone(*scene, "bone", 1, {100, 0, 0});
+    scene->UpdateScene(0.0f, true);
+    const std::vector<LineEnd> lines = LinesOf(*scene);
+    const Vec3 corners[] = {
+        {90,  -10, 0},
+        {110, -10, 0},
+        {100, 10,  0}
+    };
+    for (size_t side = 0; side < 3; ++side)
+        ExpectLine(lines, kAxisEnds + 2 * side, corners[side], corners[(side + 1) % 3], kBoneColor);
+}
+
+// The mesh is turned by a quarter about Z and scaled.
+TEST(DrawList, AxesFollowTheMeshWithItsScale)
+{
+    const Ref<CNode> scene = MakeScene({kVec3Zero, 50});
+    AttachBone(*scene, "bone", 0).m_kWorldMatrix = {
+        {0, 2, 0, 0, -1, 0, 0, 0, 0, 0, 0.5f, 0, 7, 8, 9, 1}
+    };
+    const std::vector<LineEnd> lines = LinesOf(*scene);
+    const Vec3 tips[] = {
+        {7, 18, 9    },
+        {2, 8,  9    },
+        {7, 8,  11.5f}
+    };
+    ASSERT_EQ(lines.size(), kAxisEnds);
+    for (size_t axis = 0; axis < 3; ++axis)
+        ExpectLine(lines, 2 * axis, {7, 8, 9}, tips[axis], kAxisColors[axis]);
+}
+
+TEST(DrawList, HighlightIsExactlyTheParentsName)
+{
+    const struct
+    {
+        const char* highlight;
+        const char* parent;
+        bool shines;
+    } rows[] = {
+        {"Hips",  "Hips",  true },
+        {"hips",  "Hips",  false},
+        {"Hip",   "Hips",  false},
+        {"Hips2", "Hips",  false},
+        {"mesh",  "Hips",  false},
+        {"scene", "Hips",  false},
+        {"",      "",      false},
+        {"Hips",  nullptr, false},
+        {"",      nullptr, false},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.highlight);
+        const Ref<CNode> scene = MakeScene({});
+        scene->SetName("scene");
+        AttachBone(*scene, row.parent, 1).SetName("mesh");
+        AttachBone(*scene, "other", 1);
+        const std::vector<LineEnd> lines = LinesOf(*scene, row.highlight);
+        ASSERT_EQ(lines.size(), 2 * (kAxisEnds + 6));
+        EXPECT_EQ(lines[kAxisEnds].color, row.shines ? kHighlightColor : kBoneColor);
+        EXPECT_EQ(lines.back().color, kBoneColor);
+    }
+}
+
+TEST(DrawList, FilesMayNameWhatThereIsNot)
+{
+    const Ref<CNode> scene = MakeScene({});
+    CTriMesh& odd = AttachBone(*scene, "a point that there is not", 3);
+    odd.XYZTriIndexBuffer()[4] = 9;
+    auto* const bare = new CTriMesh;
+    bare->SetTriangleQuantity(1'000'000); // without points there is no list
+    scene->AttachChild(bare);
+    EXPECT_EQ(LinesOf(*scene).size(), 2 * (kAxisEnds + 6));
+}
+
+TEST(DrawList, FollowsATreeThatChangesUnderIt)
+{
+    const Ref<CNode> scene = MakeScene({});
+    AttachBone(*scene, "first", 1);
+    CGLView view;
+    view.SetScene(scene.Get(), 1.0f, 1.0f);
+    const auto meshes = [&] { return view.DrawScene().Ends().size() / (kAxisEnds + 6); };
+    EXPECT_EQ(meshes(), 1u);
+    CSpatial* const second = AttachBone(*scene, "second", 1).GetParent();
+    EXPECT_EQ(meshes(), 2u);
+    scene->DetachChild(second); // its end
+    EXPECT_EQ(meshes(), 1u);
+
+    auto& first = static_cast<CNode&>(*scene->ChildAt(0));
+    const Ref<CSpatial> mesh = first.SetChildAt(0, nullptr);
+    EXPECT_EQ(meshes(), 0u);
+    scene->AttachChild(mesh.Get());
+    EXPECT_EQ(meshes(), 1u);
+}
+
+TEST(DrawList, KeepsItsMemoryFromFrameToFrame)
+{
+    const Ref<CNode> scene = MakeScene({});
+    AttachBone(*scene, "bone", 100);
+    CGLView view;
+    view.SetScene(scene.Get(), 1.0f, 1.0f);
+    const LineEnd* const ends = view.DrawScene().Ends().data();
+    view.StepForward();
+    EXPECT_EQ(view.DrawScene().Ends().data(), ends);
+}
+
+} // namespace
+} // namespace gw

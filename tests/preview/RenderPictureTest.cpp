@@ -1,0 +1,183 @@
+// Whole pictures: their parts, what they show and how they are written.
+
+#include "RenderPicture.h"
+#include "Pixels.h"
+#include "PreviewScene.h"
+#include "TempFolder.h"
+#include "WritePng.h"
+
+#include <gtest/gtest.h>
+#include <png.h>
+
+namespace gw {
+namespace {
+
+using Times = std::vector<float>;
+
+// The times of the poses that were drawn, which are the last that were evaluated.
+Times DrawnTimes(const CTimeKeeper& keeper, int poses)
+{
+    const Times& all = keeper.m_kTimes;
+    return {all.end() - poses, all.end()};
+}
+
+TEST(RenderPicture, ShowsAllMotionsAtTheSameShare)
+{
+    const struct
+    {
+        const char* what;
+        int frame;
+        int poses;
+        Times source;
+        Times result;
+    } rows[] = {
+        {"one frame",                      2,  1, {1},             {3}            },
+        {"a frame before the first one",   -5, 1, {0},             {0}            },
+        {"a frame after the last one",     9,  1, {2},             {6}            },
+        {"a strip of the motion",          0,  3, {0, 1, 2},       {0, 3, 6}      },
+        {"a strip from a frame on",        2,  2, {1, 2},          {3, 6}         },
+        {"a strip longer than the motion", 3,  3, {1.5f, 1.5f, 2}, {4.5f, 4.5f, 6}},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const Ref<CNode> source = MakeScene({});
+        const Ref<CNode> result = MakeScene({});
+        const CTimeKeeper& sourceTimes = AttachKeeper(*source);
+        const CTimeKeeper& resultTimes = AttachKeeper(*result);
+        PictureOptions options;
+        options.motions.push_back({source, 0.5f, 4.0f});
+        options.motions.push_back({result, 1.0f, 6.0f});
+        options.frame = row.frame;
+        options.poseCount = row.poses;
+        RgbPicture picture;
+        if (RenderPicture(options, picture) == EPictureAnswer::NoContext)
+            return;
+        EXPECT_EQ(DrawnTimes(sourceTimes, row.poses), row.source);
+        EXPECT_EQ(DrawnTimes(resultTimes, row.poses), row.result);
+    }
+}
+
+// A motion that shows one triangle.
+PictureMotion TriangleMotion(const char* boneName, const Vec3& place)
+{
+    const Ref<CNode> scene = MakeScene({});
+    AttachBone(*scene, boneName, 1, place);
+    return {scene, 1.0f, 4.0f};
+}
+
+// Of the source and the result, which have colours of their own; nothing where no picture can be drawn.
+RgbPicture TwoMotions(int poseCount)
+{
+    PictureOptions options;
+    options.motions = {TriangleMotion("source", {5000, 0, 0}), TriangleMotion("result", {0, -70, 0})};
+    options.highlight = "result";
+    options.width = 101;
+    options.height = 73;
+    options.poseCount = poseCount;
+    RgbPicture picture;
+    RenderPicture(options, picture);
+    return picture;
+}
+
+TEST(RenderPicture, GivesEachPoseItsPart)
+{
+    const RgbPicture pair = TwoMotions(1);
+    const RgbPicture strip = TwoMotions(3);
+    if (pair.rgb.empty())
+        return;
+    const struct
+    {
+        const char* what;
+        const RgbPicture& picture;
+        PixelArea area;
+        LineColor shown;
+        LineColor missing;
+    } rows[] = {
+        {"left side",                 pair,  {0, 0, 50, 73},    kBoneColor,      kHighlightColor},
+        {"right side",                pair,  {50, 0, 101, 73},  kHighlightColor, kBoneColor     },
+        {"first pose",                strip, {0, 0, 33, 36},    kBoneColor,      kHighlightColor},
+        {"second pose",               strip, {33, 0, 67, 36},   kBoneColor,      kHighlightColor},
+        {"third pose",                strip, {67, 0, 101, 36},  kBoneColor,      kHighlightColor},
+        {"first pose of the result",  strip, {0, 36, 33, 73},   kHighlightColor, kBoneColor     },
+        {"second pose of the result", strip, {33, 36, 67, 73},  kHighlightColor, kBoneColor     },
+        {"third pose of the result",  strip, {67, 36, 101, 73}, kHighlightColor, kBoneColor     },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        EXPECT_GT(CountColor(row.picture, row.shown, row.area), 20);
+        EXPECT_EQ(CountColor(row.picture, row.missing, row.area), 0);
+        EXPECT_EQ(CountColor(row.picture, {0, 0, 0}, row.area), 0) << "a part that was not drawn";
+    }
+}
+
+TEST(RenderPicture, RefusesWhatHasNoPixels)
+{
+    const struct
+    {
+        const char* what;
+        size_t motions;
+        int width;
+        int height;
+        int poses;
+    } rows[] = {
+        {"no motion",              0, 10,               10,      1 },
+        {"no width",               1, 0,                10,      1 },
+        {"a height below 0",       1, 10,               -10,     1 },
+        {"too wide",               1, kLongestSide + 1, 10,      1 },
+        {"too high",               1, 10,               1 << 30, 1 },
+        {"no pose",                1, 10,               10,      0 },
+        {"more poses than pixels", 1, 10,               10,      11},
+        {"more motions than rows", 3, 10,               2,       2 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        PictureOptions options;
+        options.motions.resize(row.motions);
+        options.width = row.width;
+        options.height = row.height;
+        options.poseCount = row.poses;
+        RgbPicture picture;
+        EXPECT_EQ(RenderPicture(options, picture), EPictureAnswer::BadSize);
+    }
+}
+
+RgbPicture SmallPicture()
+{
+    RgbPicture picture(3, 2);
+    uint8_t value = 0;
+    for (uint8_t& byte : picture.rgb)
+        byte = value = static_cast<uint8_t>(value + 13);
+    return picture;
+}
+
+TEST(WritePng, PictureComesBack)
+{
+    const CTempFolder folder;
+    const RgbPicture picture = SmallPicture();
+    ASSERT_TRUE(WritePng(folder.Path("picture.png"), picture));
+    const std::string bytes = ReadBytes(folder.Path("picture.png"));
+    png_image image{};
+    image.version = PNG_IMAGE_VERSION;
+    ASSERT_TRUE(png_image_begin_read_from_memory(&image, bytes.data(), bytes.size()));
+    image.format = PNG_FORMAT_RGB;
+    std::vector<uint8_t> read(PNG_IMAGE_SIZE(image));
+    ASSERT_TRUE(png_image_finish_read(&image, nullptr, read.data(), 0, nullptr));
+    EXPECT_EQ(image.width, 3u);
+    EXPECT_EQ(read, picture.rgb);
+}
+
+TEST(WritePng, FailureKeepsTheOldFile)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("picture.png");
+    WriteBytes(path, "old");
+    EXPECT_FALSE(WritePng(path, RgbPicture()));
+    EXPECT_FALSE(WritePng(folder.Path("no folder/picture.png"), SmallPicture()));
+    EXPECT_EQ(ReadBytes(path), "old");
+}
+
+} // namespace
+} // namespace gw
