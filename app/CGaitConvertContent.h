@@ -9,6 +9,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <optional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -180,10 +181,10 @@ private:
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
-    std::string m_kSourcePath;   ///< of the file that was opened last
-    CMotionFile m_kBaseMotion;   ///< base.htr as it is, for the editor's target tree
-    CMotionFile m_kResultMotion; ///< base.htr again, into which the motion is baked
-    CRetargeter m_kRetargeter;
+    std::string m_kSourcePath;                ///< of the file that was opened last
+    CMotionFile m_kBaseMotion;                ///< base.htr as it is, for the editor's target tree
+    CMotionFile m_kResultMotion;              ///< base.htr again, into which the motion is baked
+    std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
     std::string m_kProfilePath; ///< of the profile selected in the list; empty means none

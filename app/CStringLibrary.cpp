@@ -70,7 +70,7 @@ bool ReadHeaders(CImage& image, Headers& headers)
     if (magic != kOptional32 && magic != kOptional64)
         return false;
     const uint64_t directories = optional + (magic == kOptional32 ? 96 : 112);
-    constexpr uint32_t kResourceDirectory = 2;
+    constexpr uint64_t kResourceDirectory = 2;
     if (image.U32(directories - 4) <= kResourceDirectory)
         return false;
     headers.m_uiSectionCount = image.U16(start + 6);

@@ -7,8 +7,12 @@
 #include "FailureWords.h"
 #include "FindBone.h"
 #include "Mat4.h"
+#include "ProfileFit.h"
 #include "SourceTiming.h"
 #include "StringTable.h"
+#include "Text.h"
+
+#include <span>
 
 namespace gw {
 
@@ -22,10 +26,10 @@ void RebuildRows(Mat4& matrix)
 {
     const Vec3 lengths = RowLengths(matrix);
     const float length[] = {lengths.x, lengths.y, lengths.z};
-    for (int row = 0; row < 3; ++row)
+    for (size_t row = 0; row < 3; ++row)
     {
-        float* const element = matrix.m + 4 * row;
-        for (int column = 0; column < 3 && length[row] != 0.0f; ++column)
+        const std::span<float, 4> element = std::span(matrix.m).subspan(4 * row).first<4>();
+        for (size_t column = 0; column < 3 && length[row] != 0.0f; ++column)
             element[column] = element[column] / length[row] * length[row];
         element[3] = 0.0f;
     }
@@ -55,13 +59,15 @@ int CGaitConvertContent::ConvertMotion()
     return 1;
 }
 
-// Fills the retargeter's tables from the profile. False, with the reason reported, when they cannot drive a
-// conversion.
+// Fills a retargeter's tables from the profile. It is a new one: tables are keyed by the target's bones, and
+// a bone of a target that is gone may lie where one of the present target lies now. False, with the reason
+// reported, when they cannot drive a conversion.
 bool CGaitConvertContent::PrepareRetargeter()
 {
-    const bool ready = m_pkProfile && m_pkProfile->ApplyProfile(&m_kRetargeter, nullptr, nullptr) &&
+    CRetargeter& retargeter = m_kRetargeter.emplace();
+    const bool ready = m_pkProfile && m_pkProfile->ApplyProfile(&retargeter, nullptr, nullptr) &&
                        m_pkProfile->HasRootMapping() &&
-                       m_kRetargeter.SourceOf(FindBone(m_kResultMotion.motionRoot.Get(), kRootBone));
+                       retargeter.SourceOf(FindBone(m_kResultMotion.motionRoot.Get(), kRootBone));
     if (!ready)
         ReportMisfit();
     return ready;
@@ -69,8 +75,8 @@ bool CGaitConvertContent::PrepareRetargeter()
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
 {
-    m_kRetargeter.Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
-    Report(m_kSourcePath, m_kRetargeter.Record());
+    m_kRetargeter->Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
+    Report(m_kSourcePath, m_kRetargeter->Record());
     const SourceTiming result = TimingOf(m_kResultMotion);
     if (m_pkResultView)
         m_pkResultView->SetScene(m_kResultMotion.motionRoot.Get(), result.FrameStep(), result.lastFrame);
@@ -106,24 +112,18 @@ void CGaitConvertContent::ReportMisfit()
 // Reports each row that names a bone which is not there; false when there is none.
 bool CGaitConvertContent::ReportMissingBones()
 {
-    const CBoneNames sources(SourceRoot());
-    const CBoneNames targets(m_kResultMotion.motionRoot.Get());
-    const CMapRowTable& rows = m_pkProfileDialog->Rows();
-    bool found = false;
-    for (int row = 0; row < rows.RowCount(); ++row)
+    const CProfileFit fit =
+        MeasureFit(m_pkProfileDialog->Rows(), SourceRoot(), m_kResultMotion.motionRoot.Get());
+    for (const CMissingBone& bone : fit.missing)
     {
-        const std::string& source = rows.Text(row, kSourceColumn);
-        const std::string& target = rows.Text(row, kTargetColumn);
-        const bool hasSource = rows.IsFixed(row) || sources.Find(source);
-        if (!hasSource)
-            m_kWindow.Report(MakeReport(m_kProfilePath, EMisfit::NoSourceBone, source));
-        else if (!targets.Find(target))
-            m_kWindow.Report(MakeReport(m_kProfilePath, EMisfit::NoTargetBone, target));
-        else
-            continue;
-        found = true;
+        const bool isSource = bone.side == ESkeletonSide::Source;
+        CReport report =
+            MakeReport(m_kProfilePath, isSource ? EMisfit::NoSourceBone : EMisfit::NoTargetBone, bone.name);
+        if (!bone.nearest.empty())
+            report.words += "; the nearest name is \"" + Printable(bone.nearest) + '"';
+        m_kWindow.Report(report);
     }
-    return found;
+    return !fit.missing.empty();
 }
 
 } // namespace gw

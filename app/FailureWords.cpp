@@ -26,8 +26,7 @@ constexpr Words<Reason> Row(Reason reason, std::string_view code, std::string_vi
     return {reason, code, words, remedy};
 }
 
-constexpr std::string_view kMend = "'gaitwright doctor --fix' writes a mended copy";
-constexpr std::string_view kFind = "'gaitwright doctor' lists all such places";
+constexpr std::string_view kMendLine = "mend the line, or export the file again";
 constexpr std::string_view kCopyAgain = "the file is cut short or damaged: copy or export it again";
 constexpr std::string_view kMapHip = "map the source's hip to it";
 
@@ -45,15 +44,16 @@ constexpr Words<EFailure> kFailures[] = {
     Row(BadVersion, "bad-version", "this version of the format is not supported"),
     Row(Empty, "empty", "there is nothing in the file that could be used"),
     Row(MissingSection, "missing-section", "a section or keyword is missing", kCopyAgain),
-    Row(UnexpectedLine, "unexpected-line", "another line stands where this keyword is expected", kFind),
-    Row(BlankLine, "blank-line", "an empty line between MOTION and Frames:", kMend),
-    Row(BadNumber, "bad-number", "a number is expected here, and this is none that can be used", kFind),
+    Row(UnexpectedLine, "unexpected-line", "another line stands where this keyword is expected", kMendLine),
+    Row(BlankLine, "blank-line", "an empty line where this keyword must stand", "take the empty line out"),
+    Row(BadNumber, "bad-number", "a number is expected here, and this is none that can be used", kMendLine),
     Row(BadCount, "bad-count", "a count is larger than the rest of the file can hold", kCopyAgain),
     Row(BadName, "bad-name", "a name is missing or longer than 255 characters",
         "give the bone a shorter name"),
-    Row(BadBrace, "bad-brace", "a brace is missing or stands where none belongs", kFind),
-    Row(MissingTokens, "missing-tokens", "a line holds fewer values than it must", kFind),
-    Row(TooFewRows, "too-few-rows", "there are fewer rows of values than frames", kMend),
+    Row(BadBrace, "bad-brace", "a brace is missing or stands where none belongs", kMendLine),
+    Row(MissingTokens, "missing-tokens", "a line holds fewer values than it must", kMendLine),
+    Row(TooFewRows, "too-few-rows", "there are fewer rows of values than frames",
+        "set the count of frames to the rows that there are"),
     Row(NoRoot, "no-root", "the hierarchy has no ROOT, or a JOINT stands before it"),
     Row(UnknownSegment, "unknown-segment", "a section is for a bone that the hierarchy does not name"),
     Row(UnknownClass, "unknown-class", "the file holds an object of a class that is not known here"),
@@ -62,12 +62,12 @@ constexpr Words<EFailure> kFailures[] = {
     Row(TooDeep, "too-deep", "bones or objects are nested deeper than is supported"),
     Row(TooLarge, "too-large", "this is larger than the limit of the format or of the program"),
     Row(NoTrack, "no-track", "the scene holds no keyframes, so there is no motion to convert"),
-    Row(ShortRow, "short-row", "a row has too few values for its joints", kMend),
-    Row(StuckNumber, "stuck-number", "a number has something stuck to it; its beginning was read", kMend),
+    Row(ShortRow, "short-row", "a row has too few values for its joints", "export the file again"),
+    Row(StuckNumber, "stuck-number", "a number has something stuck to it; its beginning was read", kMendLine),
     Row(DoubledOffsets, "doubled-offsets", "joint positions repeat the offsets, so bones come out doubled",
-        kMend),
+        "export rotations only, or take the position channels out"),
     Row(RestPose, "rest-pose", "the rest pose is no T-pose, so limbs may come out turned",
-        "set rotation offsets in the profile; 'gaitwright suggest' drafts them"),
+        "set rotation offsets in the profile"),
     Row(BadScale, "bad-scale", "the skeletons could not be compared in size; the factor 1 was taken",
         "map both feet and the left thigh in the profile"),
     Row(UnknownChannel, "unknown-channel", "a channel has a name that is not known; it was passed over"),
@@ -79,8 +79,7 @@ constexpr Words<EMisfit> kMisfits[] = {
         "see that base.htr lies beside the program"),
     Row(EMisfit::NoProfile, "no-profile", "no profile is selected",
         "choose one that fits the source's bones"),
-    Row(EMisfit::NoSourceBone, "no-source-bone", "the source has no bone of a name in the profile",
-        "'gaitwright profiles SOURCE' shows the nearest names"),
+    Row(EMisfit::NoSourceBone, "no-source-bone", "the source has no bone of a name in the profile"),
     Row(EMisfit::NoTargetBone, "no-target-bone", "the target has no bone of a name in the profile"),
     Row(EMisfit::NoRootRow, "no-root-row", "no row of the profile drives the target's root bone", kMapHip),
     Row(EMisfit::NoRootSource, "no-root-source", "the profile keeps the target's root bone fixed", kMapHip),

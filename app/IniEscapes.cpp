@@ -67,7 +67,7 @@ void TakeEscape(std::string_view text, size_t& place, std::string& value)
 }
 
 // "@" begins what is no plain text: "@@" stands for one, and bytes are taken as they are.
-std::string WithoutMark(std::string value)
+std::string WithoutMark(const std::string& value)
 {
     constexpr std::string_view kBytes = "@ByteArray(";
     if (value.starts_with(kBytes) && value.ends_with(')'))
@@ -126,7 +126,7 @@ std::string UnescapedIniValue(std::string_view text)
     const auto endElement = [&] {
         while (element.size() > keep && kIniBlanks.find(element.back()) != kIniBlanks.npos)
             element.pop_back();
-        value += WithoutMark(std::move(element));
+        value += WithoutMark(element);
         element.clear();
         keep = 0;
     };

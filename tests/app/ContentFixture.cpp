@@ -48,6 +48,25 @@ EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButton
     return answer == m_kAnswers.end() ? EAnswer::OK : answer->second;
 }
 
+void CScriptedWindow::Report(const CReport& report)
+{
+    m_kReports.push_back(report);
+    m_kCalls.push_back("report " + report.code + (report.name.empty() ? "" : ' ' + report.name));
+}
+
+std::string CScriptedWindow::TakeWords()
+{
+    std::string words;
+    for (const std::string& call : TakeCalls())
+    {
+        std::string_view rest = call;
+        const std::string_view verb = NextWord(rest);
+        if (verb == "report" || verb == "box")
+            words.append(words.empty() ? "" : ", ").append(rest.substr(1));
+    }
+    return words;
+}
+
 std::optional<std::string> CScriptedWindow::AskOpenFile(const CFileDialogSetup& setup)
 {
     m_kCalls.push_back("open *." + setup.defaultExtension + " in " + setup.initialFolder);
@@ -161,15 +180,12 @@ std::string TargetText()
     std::string data;
     for (const auto& [bone, parent] : kTargetBones)
     {
-        const bool isRoot = std::string_view(parent) == "GLOBAL";
-        const bool isThigh = std::string_view(bone).ends_with("Thigh");
-        text += std::string(bone) + ' ' + parent + '\n';
-        rest += std::string(bone) +
-                (isRoot    ? " 0 920 0"
-                 : isThigh ? (*bone == 'L' ? " 95 -40 0" : " -95 -40 0")
-                           : " 0 -400 0") +
-                " 0 0 0 400\n";
-        data += '[' + std::string(bone) + "]\n1 0 0 0 0 0 0 1\n";
+        const std::string_view name = bone;
+        const bool isThigh = name.ends_with("Thigh");
+        const char* const place = isThigh ? (*bone == 'L' ? " 95 -40 0" : " -95 -40 0") : " 0 -400 0";
+        text.append(bone).append(" ").append(parent).append("\n");
+        rest.append(bone).append(name == "LowerTorso" ? " 0 920 0" : place).append(" 0 0 0 400\n");
+        data.append("[").append(bone).append("]\n1 0 0 0 0 0 0 1\n");
     }
     return text + rest + data + "[EndOfFile]\n";
 }
@@ -187,8 +203,12 @@ std::string BvhText(const SourceBones& bones, int frameCount)
     for (int frame = 0; frame < frameCount; ++frame)
     {
         const std::string n = std::to_string(5 * frame);
-        text += "0 8" + std::to_string(frame % 10) + ' ' + n + " 0 0 " + n + " 0 -" + n + " 0 0 " + n +
-                " 0 0 0 0 0 " + n + " 0 0 " + n + " 0 0 0 0\n";
+        for (const std::string& value :
+             {std::string("0"), std::string("80"), n, std::string("0"), std::string("0"), n})
+            text.append(value).append(" ");
+        for (int joint = 0; joint < 6; ++joint)
+            text.append("0 ").append(joint % 2 == 0 ? "-" : "").append(n).append(" 0 ");
+        text += '\n';
     }
     return text;
 }
@@ -206,7 +226,7 @@ std::string BoneMapText(const std::string& name, const SourceBones& bones)
     };
     std::string text = name + "\nFrameRate 30\nPosition 0 0 0\n";
     for (const auto& [source, target] : rows)
-        text += source + " <---> " + target + " 0,0,0,1,2,3\n";
+        text.append(source).append(" <---> ").append(target).append(" 0,0,0,1,2,3\n");
     return text;
 }
 
@@ -231,7 +251,7 @@ ContentTest::ContentTest()
 
 std::string ContentTest::Write(const std::string& name, const std::string& text) const
 {
-    const std::string path = m_kFolder.Path(name);
+    std::string path = m_kFolder.Path(name);
     CreateFolder(SplitPath(path).folder);
     WriteBytes(path, text);
     return path;

@@ -63,7 +63,7 @@ public:
     std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
     std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
-    void Report(const CReport& report) override { m_kReports.push_back(report); }
+    void Report(const CReport& report) override;
     void ShowBatchFile(size_t, size_t, const std::string& path) override
     {
         if (m_kOnBatchFile)
@@ -90,6 +90,8 @@ public:
     std::set<std::string> Enabled() const;
     /// What was called since the last time.
     std::vector<std::string> TakeCalls() { return std::exchange(m_kCalls, {}); }
+    /// Of these the reports and message boxes: "not-found, 138".
+    std::string TakeWords();
 
     std::optional<std::string> m_kOpenAnswer;
     std::optional<std::string> m_kSaveAnswer;
@@ -100,7 +102,7 @@ public:
         m_kOnBatchFile; ///< what happens while a batch takes up a file
     CProfileList m_kList;
     std::map<std::string, bool> m_kEnabled;
-    std::vector<CReport> m_kReports;
+    std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"
     std::vector<std::string> m_kTitles;
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes
     std::vector<std::string> m_kCalls;

@@ -10,7 +10,7 @@ constexpr uint32_t kSectionAddress = 0x1000; // in memory
 constexpr uint32_t kSectionOffset = 0x200;   // in the file
 constexpr uint32_t kSubdirectory = 0x80000000;
 
-void Put(std::string& bytes, size_t offset, uint32_t value, size_t byteCount)
+void Put(std::string& bytes, size_t offset, uint64_t value, size_t byteCount)
 {
     if (bytes.size() < offset + byteCount)
         bytes.resize(offset + byteCount);
@@ -18,7 +18,7 @@ void Put(std::string& bytes, size_t offset, uint32_t value, size_t byteCount)
         bytes[offset + i] = static_cast<char>(value >> (8 * i) & 0xff);
 }
 
-void Append(std::string& bytes, uint32_t value, size_t byteCount)
+void Append(std::string& bytes, uint64_t value, size_t byteCount)
 {
     Put(bytes, bytes.size(), value, byteCount);
 }

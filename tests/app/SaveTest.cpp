@@ -92,20 +92,17 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
     {
         const char* what;
         const char* name;
-        const char* code;
     } rows[] = {
-        {"a read-only package",        "old.Kinetra",      "write-error"},
-        {"a folder that is not there", "none/out.Kinetra", "write-error"},
-        {"an HTR in such a folder",    "none/out.htr",     "write-error"},
+        {"a read-only package",        "old.Kinetra"     },
+        {"a folder that is not there", "none/out.Kinetra"},
+        {"an HTR in such a folder",    "none/out.htr"    },
     };
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.what);
-        m_kWindow.m_kReports.clear();
         EXPECT_EQ(SaveAs(row.name), 1);
         EXPECT_TRUE(m_kContent.IsSaved()) << "the flag goes as if it had been written";
-        ASSERT_FALSE(m_kWindow.m_kReports.empty());
-        EXPECT_EQ(m_kWindow.m_kReports[0].code, row.code);
+        EXPECT_EQ(m_kWindow.TakeWords().find("write-error"), 0u);
         EXPECT_EQ(m_kWindow.m_kTitles.back().find("Gaitwright v2.0 - not saved: "), 0u)
             << m_kWindow.m_kTitles.back();
     }

@@ -164,7 +164,7 @@ TEST(FailureWords, AReportSaysWhereAndWhatToDo)
         const char* line;
     } rows[] = {
         {"a line",
-         "a.bvh",   {EFailure::BlankLine, 12, {}},
+         "a.bvh",   {EFailure::BlankLine, 12, "Frames:"},
          "a.bvh:12: an empty line between MOTION and Frames: ('gaitwright doctor --fix' writes a mended "
          "copy)"                                                                                  },
         {"a byte of a container",
