@@ -80,6 +80,23 @@ CNode* ChildTowards(const CNode& node, CNode* below)
     return below;
 }
 
+bool IsAbove(const CNode& node, const CNode* below)
+{
+    while (below && below != &node)
+        below = below->GetParentNode();
+    return below != nullptr;
+}
+
+// The nearest node at or above a source bone that has the next bone's source below it: the bone itself where
+// the rows follow the skeleton, the chest where a collar drives the torso and the next bone is the neck.
+CNode* SourceStart(CNode& source, const CNode* next)
+{
+    CNode* start = &source;
+    while (next && start && (start == next || !IsAbove(*start, next)))
+        start = start->GetParentNode();
+    return start ? start : &source;
+}
+
 CNode* JointBelow(const CNode& node, CNode* goal)
 {
     for (const CNode* at = &node;;)
@@ -97,7 +114,9 @@ CNode* JointBelow(const CNode& node, CNode* goal)
 BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources)
 {
     CNode* const next = NextMapped(*pair.target, sources);
-    return {JointBelow(*pair.target, next), JointBelow(*pair.source, sources.SourceOf(next))};
+    CNode* const sourceNext = sources.SourceOf(next);
+    CNode* const start = SourceStart(*pair.source, sourceNext);
+    return {JointBelow(*pair.target, next), JointBelow(*start, sourceNext), start};
 }
 
 CNode* JointAbove(const CNode& node)

@@ -11,6 +11,7 @@ struct BoneEnds
 {
     CNode* target = nullptr;
     CNode* source = nullptr;
+    CNode* sourceStart = nullptr; ///< where the source's direction begins; never null
 };
 
 /// Finds them by the rule of BoneMeasures. Both trees are posed, so that helper joints at the place of their

@@ -16,7 +16,7 @@ void CDirectionMeter::Add()
 }
 
 CBoneMeter::CBoneMeter(const BonePair& pair, const BoneEnds& ends)
-    : m_kSource(*pair.source, *ends.source), m_kTarget(*pair.target, *ends.target)
+    : m_kSource(*ends.sourceStart, *ends.source), m_kTarget(*pair.target, *ends.target)
 {
 }
 

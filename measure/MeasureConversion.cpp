@@ -128,7 +128,7 @@ void CComparison::PlanBones(std::span<const BonePair> pairs)
 
 void CComparison::WatchPair(const BonePair& pair, const BoneEnds& ends)
 {
-    m_kSource.Watch(pair.source);
+    m_kSource.Watch(ends.sourceStart);
     m_kSource.Watch(ends.source);
     m_kResult.Watch(pair.target);
     m_kResult.Watch(ends.target);

@@ -65,7 +65,7 @@ CObject* CTriMesh::CreateClone() const
 void CTriMesh::Fields(CFieldArchive& archive)
 {
     CGeometry::Fields(archive);
-    archive.Signed("GetTriangleQuantity", m_iTriangleCount);
+    archive.Signed("triangle quantity", m_iTriangleCount);
     const int64_t corners = int64_t{3} * m_iTriangleCount;
     archive.OptionalBlock("XYZTriIndexBuffer", m_kXYZTriIndex, corners);
     archive.OptionalBlock("NormalTriIndexBuffer", m_kNormalTriIndex, corners);

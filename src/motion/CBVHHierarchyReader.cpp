@@ -1,6 +1,6 @@
 #include "CBVHHierarchyReader.h"
 
-#include "COrrinStream.h"
+#include "CGraphCheck.h"
 #include "CTextLines.h"
 #include "MotionNode.h"
 #include "Numbers.h"

@@ -1,6 +1,6 @@
 #include "CHTRReader.h"
 
-#include "COrrinStream.h"
+#include "CGraphCheck.h"
 #include "CTextLines.h"
 #include "MotionNode.h"
 #include "Numbers.h"
@@ -222,12 +222,11 @@ void CHTRReader::WarnOfMissingRows()
 {
     for (const auto& segment : m_kFile.segments)
     {
-        const auto found = m_kFile.segmentOfName.find(segment->name);
         const auto rows = static_cast<int64_t>(segment->scales.size());
-        if (found != m_kFile.segmentOfName.end() && found->second == segment.get() &&
-            rows < m_kFile.numFrames)
-            m_kRecord.Warn(rows > 0 ? EFailure::TooFewRows : EFailure::MissingSection, segment->line,
-                           segment->name);
+        if (rows >= m_kFile.numFrames || !m_kFile.segmentOfName.contains(segment->name))
+            continue;
+        const EFailure reason = rows > 0 ? EFailure::TooFewRows : EFailure::MissingSection;
+        m_kRecord.Warn(reason, segment->line, segment->name);
     }
 }
 

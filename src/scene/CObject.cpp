@@ -240,27 +240,25 @@ void CObject::AppendBindOrder(std::vector<CObject*>& order)
     order.insert(order.end(), held.begin(), held.end());
 }
 
-bool CObject::Bind(CObject& root)
+std::vector<CObject*> CObject::BindOrder()
 {
     std::vector<CObject*> order;
     AppendBindOrder(order);
-    for (CObject* held : order)
-    {
-        if (held)
-            held->Bind(root);
-    }
+    std::erase(order, nullptr);
+    return order;
+}
+
+bool CObject::Bind(CObject& root)
+{
+    for (CObject* held : BindOrder())
+        held->Bind(root);
     return true;
 }
 
 bool CObject::Rebind(const CCloneMap& map)
 {
-    std::vector<CObject*> order;
-    AppendBindOrder(order);
-    for (CObject* held : order)
-    {
-        if (held)
-            held->Rebind(map);
-    }
+    for (CObject* held : BindOrder())
+        held->Rebind(map);
     return true;
 }
 

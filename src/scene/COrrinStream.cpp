@@ -2,18 +2,19 @@
 
 #include "CFieldReader.h"
 #include "CFieldWriter.h"
+#include "CGraphCheck.h"
 #include "CMappedFile.h"
 #include "CSafeFile.h"
 
-#include <algorithm>
 #include <cstring>
 
 namespace gw {
 
 namespace {
 
-constexpr std::string_view kHeader("TKOrrin Version 1.20", 21); // with its zero byte
-constexpr size_t kHeaderCompared = 16;                          // the digits of the version are free
+constexpr char kHeaderText[] = "TKOrrin Version 1.20";
+constexpr std::string_view kHeader(kHeaderText, sizeof kHeaderText); // with its zero byte
+constexpr size_t kHeaderCompared = 16;                               // the digits of the version are free
 constexpr size_t kLeastFileBytes = 21;
 constexpr std::string_view kRootMarker = "_OrrinRoot";
 constexpr std::string_view kThumbnailTag = "_OrrinThumbnail";
@@ -89,83 +90,6 @@ void Unlink(CObject& object)
     CLinkVisitor visitor([](const CLinkSlot& slot) { slot.Set(nullptr); });
     object.Fields(visitor);
 }
-
-// Walks a graph by its counted references, without recursion, and tells what recursion would meet: rings, the
-// deepest nesting, and the number of places that a walk would visit when shared objects are visited once per
-// place.
-class CGraphCheck
-{
-public:
-    EFailure Check(const std::vector<CObject*>& objects)
-    {
-        double visits = 0.0;
-        for (CObject* object : objects)
-        {
-            const EFailure reason = Walk(*object);
-            if (reason != EFailure::None)
-                return reason;
-        }
-        for (const auto& [object, entry] : m_kEntries)
-            visits = std::max(visits, entry.visits);
-        return visits > kVisitsPerObject * static_cast<double>(objects.size()) ? EFailure::TooLarge
-                                                                               : EFailure::None;
-    }
-
-private:
-    struct Entry
-    {
-        size_t depth = 1;
-        double visits = 1.0;
-        bool finished = false;
-    };
-    struct Step
-    {
-        CObject* object;
-        std::vector<CObject*> held;
-        size_t next = 0;
-    };
-
-    EFailure Walk(CObject& start)
-    {
-        if (!m_kEntries.try_emplace(&start).second)
-            return EFailure::None;
-        std::vector<Step> path;
-        path.push_back({&start, start.HeldObjects()});
-        while (!path.empty())
-        {
-            Step& step = path.back();
-            if (step.next < step.held.size())
-            {
-                CObject* held = step.held[step.next++];
-                const auto [entry, fresh] = m_kEntries.try_emplace(held);
-                if (fresh)
-                    path.push_back({held, held->HeldObjects()});
-                else if (!entry->second.finished)
-                    return EFailure::Cycle;
-                continue;
-            }
-            if (!Finish(step))
-                return EFailure::TooDeep;
-            path.pop_back();
-        }
-        return EFailure::None;
-    }
-
-    bool Finish(const Step& step)
-    {
-        Entry& entry = m_kEntries[step.object];
-        for (const CObject* held : step.held)
-        {
-            const Entry& below = m_kEntries[held];
-            entry.depth = std::max(entry.depth, below.depth + 1);
-            entry.visits += below.visits;
-        }
-        entry.finished = true;
-        return entry.depth <= kNestingLimit;
-    }
-
-    std::unordered_map<const CObject*, Entry> m_kEntries;
-};
 
 } // namespace
 
@@ -358,7 +282,7 @@ bool COrrinStream::CheckGraph()
     objects.reserve(m_kRecords.size());
     for (const auto& record : m_kRecords)
         objects.push_back(record->m_spkObject.Get());
-    const EFailure reason = CGraphCheck().Check(objects);
+    const EFailure reason = CGraphCheck().Check(objects, m_kRoots);
     return reason == EFailure::None || m_kRecord.Fail(reason);
 }
 

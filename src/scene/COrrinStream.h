@@ -29,11 +29,6 @@ struct CLinkRecord
     std::vector<uint32_t> m_kLinkID;
 };
 
-/// Nesting by counted references that a load accepts. Updates, searches and destructors recurse once per
-/// level.
-inline constexpr size_t kNestingLimit = 4000;
-/// A graph whose walks would visit more places than this for each object is refused.
-inline constexpr double kVisitsPerObject = 1e6;
 /// Containers are at most this large, read or written: offsets in them are signed 32-bit.
 inline constexpr uint64_t kContainerBytesLimit = 0x7fffffff;
 

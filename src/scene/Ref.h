@@ -28,7 +28,8 @@ public:
 
     Ref& operator=(const Ref& other)
     {
-        Assign(other.m_pkObject);
+        if (this != &other)
+            Assign(other.m_pkObject);
         return *this;
     }
     Ref& operator=(Ref&& other) noexcept

@@ -165,17 +165,16 @@ TEST(FailureWords, AReportSaysWhereAndWhatToDo)
     } rows[] = {
         {"a line",
          "a.bvh",   {EFailure::BlankLine, 12, "Frames:"},
-         "a.bvh:12: an empty line between MOTION and Frames: ('gaitwright doctor --fix' writes a mended "
-         "copy)"                                                                                  },
+         "a.bvh:12: an empty line where this keyword must stand: \"Frames:\" (take the empty line out)"},
         {"a byte of a container",
          "a.orn",   {EFailure::UnknownClass, 381, "CSpoon"},
-         "a.orn: byte 381: the file holds an object of a class that is not known here: \"CSpoon\""},
+         "a.orn: byte 381: the file holds an object of a class that is not known here: \"CSpoon\""     },
         {"a name that would command a terminal",
          "\x1b[2J", {EFailure::TooDeep, 0, "\x1b[31m"},
-         "\\x1b[2J: bones or objects are nested deeper than is supported: \"\\x1b[31m\""          },
+         "\\x1b[2J: bones or objects are nested deeper than is supported: \"\\x1b[31m\""               },
         {"the path is not said twice",
          "a.htr",   {EFailure::NotRegular, 0, "a.htr"},
-         "a.htr: this is a folder or a device, not a file"                                        },
+         "a.htr: this is a folder or a device, not a file"                                             },
     };
     for (const auto& row : rows)
         EXPECT_EQ(ReportLine(MakeReport(row.path, row.failure, false)), row.line) << row.what;

@@ -110,8 +110,9 @@ TEST_F(ContentTest, AFailedOpenKeepsTheSource)
     Write("cut.orn", whole.substr(0, whole.size() - 9));
     WriteContainer("still.orn", false);
     Write("words.bvh", "hello\n");
-    std::string blank = BvhText(kPoserBones);
-    Write("blank.bvh", blank.insert(blank.find("Frames:"), "\n"));
+    const std::string text = BvhText(kPoserBones);
+    const size_t frames = text.find("Frames:");
+    Write("blank.bvh", text.substr(0, frames) + '\n' + text.substr(frames));
     const struct
     {
         const char* what;

@@ -2,11 +2,14 @@
 
 #include "Angles.h"
 #include "CMadeFigure.h"
+#include "FindContacts.h"
 
 #include <algorithm>
 #include <cmath>
+#include <functional>
 #include <gtest/gtest.h>
 #include <random>
+#include <vector>
 
 namespace gw {
 
@@ -87,6 +90,61 @@ TEST(MeasureFeet, NoiseMakesNoContacts)
         EXPECT_EQ(foot.sourceContacts, 3u);
         EXPECT_EQ(foot.resultContacts, 3u);
         EXPECT_GT(foot.contactF1.value_or(0.0), 0.97);
+    }
+}
+
+// An ankle of a leg of 800 mm: it begins to stand below 48 mm and 280 mm/s, and leaves above 80 mm or 480
+// mm/s.
+TEST(FindContacts, ThresholdsHaveASlack)
+{
+    constexpr int kFrameCount = 60;
+    const struct
+    {
+        const char* what;
+        double rate;
+        std::function<Vec3(int frame)> place;
+        std::vector<int> borders; // first frame and end of each contact
+    } rows[] = {
+        {"it hovers where a stand begins",
+         30.0,  [](int f) {
+             return Vec3{0.0f, f % 8 < 4 ? 46.0f : 50.0f, 0.0f};
+         },  {0, 60}       },
+        {"it rises above where one ends",
+         30.0,  [](int f) {
+             return Vec3{0.0f, f < 20 ? 0.0f : 85.0f, 0.0f};
+         },  {0, 20}       },
+        {"it hovers too high from the start",
+         30.0,  [](int) {
+             return Vec3{0.0f, 60.0f, 0.0f};
+         },  {}            },
+        {"it drifts faster and faster",
+         30.0,  [](int f) {
+             return Vec3{0.2f * static_cast<float>(f * f), 0.0f, 0.0f};
+         },  {0, 41}       },
+        {"it brushes the floor",
+         30.0,  [](int f) {
+             return Vec3{0.0f, f % 30 < 2 ? 0.0f : 90.0f, 0.0f};
+         },  {}            },
+        {"it taps the floor for a tenth of a second",
+         30.0,  [](int f) {
+             return Vec3{0.0f, f % 30 < 3 ? 0.0f : 90.0f, 0.0f};
+         },  {0, 3, 30, 33}},
+        {"a fast recording shakes",
+         120.0, [](int f) {
+             return Vec3{f % 2 == 0 ? 3.0f : -3.0f, 0.0f, 0.0f};
+         }, {0, 60}       },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        std::vector<Vec3> places;
+        for (int f = 0; f < kFrameCount; ++f)
+            places.push_back(row.place(f));
+        const FloorPath ankle{places, 0.0f};
+        std::vector<int> borders;
+        for (const Contact& contact : FindContacts({&ankle, 1}, 800.0, 1.0 / row.rate))
+            borders.insert(borders.end(), {contact.first, contact.end});
+        EXPECT_EQ(borders, row.borders);
     }
 }
 

@@ -491,8 +491,11 @@ TEST(Nesting, SharedNodesAreLegalUntilTheirPlacesExplode)
     EXPECT_EQ(found.size(), 1023u) << "once per place";
     EXPECT_EQ(stream.ObjectsInSaveOrder().size(), 10u);
     EXPECT_TRUE(SurvivesRewriting(stream));
-    EXPECT_FALSE(LoadBytes(stream, lattice(64)));
-    EXPECT_EQ(stream.Record().Failure().reason, EFailure::TooLarge);
+    for (const uint32_t levels : {30u, 3000u})
+    {
+        EXPECT_FALSE(LoadBytes(stream, lattice(levels)));
+        EXPECT_EQ(stream.Record().Failure().reason, EFailure::TooLarge);
+    }
 }
 
 TEST(COrrinStream, AHundredThousandFlatNodesLoadAndSave)
