@@ -12,40 +12,40 @@ namespace gw {
 enum class EFailure : uint8_t
 {
     None,
-    NotFound,        ///< the file cannot be opened or examined
-    NotRegular,      ///< the path is a folder or a device
-    ReadError,       ///< the file system failed while reading
-    WriteError,      ///< the file system failed while writing: full disk, no permission
-    OutOfMemory,     ///< more memory than can be had
-    UnknownFormat,   ///< no reader for this extension
-    BadHeader,       ///< the file does not begin as it must
-    BadVersion,      ///< a version that is not supported
-    Empty,           ///< nothing in the file that could be used
-    MissingSection,  ///< a section or keyword never comes; `name` says which
-    UnexpectedLine,  ///< another line stands where a keyword must stand; `name` is the keyword
-    BlankLine,       ///< an empty line where none may stand
-    BadNumber,       ///< no number, or one that is not finite; `name` is the text
-    BadCount,        ///< a count that the rest of the file cannot hold
-    BadName,         ///< a name that is too long or missing
-    BadBrace,        ///< a brace too many or too few
-    MissingTokens,   ///< a line with fewer values than it must have; `name` is the joint or key
-    TooFewRows,      ///< fewer rows than frames
-    NoRoot,          ///< a joint before any root, or no root at all
-    UnknownSegment,  ///< a section for a bone that the hierarchy does not name
-    UnknownClass,    ///< an object of a class that cannot be made
-    Truncated,       ///< the file ends inside a record
-    Cycle,           ///< objects hold each other in a ring
-    TooDeep,         ///< nested deeper than the limit
-    TooLarge,        ///< what would take more than the limit
-    NoTrack,         ///< a scene without keyframes
+    NotFound,       ///< the file cannot be opened or examined
+    NotRegular,     ///< the path is a folder or a device
+    ReadError,      ///< the file system failed while reading
+    WriteError,     ///< the file system failed while writing: full disk, no permission
+    OutOfMemory,    ///< more memory than can be had
+    UnknownFormat,  ///< no reader for this extension
+    BadHeader,      ///< the file does not begin as it must
+    BadVersion,     ///< a version that is not supported
+    Empty,          ///< nothing in the file that could be used
+    MissingSection, ///< a section or keyword never comes; `name` says which
+    UnexpectedLine, ///< another line stands where a keyword must stand; `name` is the keyword
+    BlankLine,      ///< an empty line where none may stand
+    BadNumber,      ///< no number, or one that is not finite; `name` is the text
+    BadCount,       ///< a count that the rest of the file cannot hold
+    BadName,        ///< a name that is too long or missing
+    BadBrace,       ///< a brace too many or too few
+    MissingTokens,  ///< a line with fewer values than it must have; `name` is the joint or key
+    TooFewRows,     ///< fewer rows than frames
+    NoRoot,         ///< a joint before any root, or no root at all
+    UnknownSegment, ///< a section for a bone that the hierarchy does not name
+    UnknownClass,   ///< an object of a class that cannot be made
+    Truncated,      ///< the file ends inside a record
+    Cycle,          ///< objects hold each other in a ring
+    TooDeep,        ///< nested deeper than the limit
+    TooLarge,       ///< what would take more than the limit
+    NoTrack,        ///< a scene without keyframes
     // Things that are read all the same.
-    ShortRow,        ///< a row with too few values for its joints
-    StuckNumber,     ///< a number with something stuck to it
-    DoubledOffsets,  ///< joint positions that repeat the offsets, so that bones come out doubled
-    RestPose,        ///< a rest pose that is no T-pose
-    BadScale,        ///< the body measures give no usable scale; 1.0 was taken
-    UnknownChannel,  ///< a channel name that is not one of the nine
-    CutName,         ///< a name that was not usable as it stands
+    ShortRow,       ///< a row with too few values for its joints
+    StuckNumber,    ///< a number with something stuck to it
+    DoubledOffsets, ///< joint positions that repeat the offsets, so that bones come out doubled
+    RestPose,       ///< a rest pose that is no T-pose
+    BadScale,       ///< the body measures give no usable scale; 1.0 was taken
+    UnknownChannel, ///< a channel name that is not one of the nine
+    CutName,        ///< a name that was not usable as it stands
 };
 
 /// One thing that failed or that a user should know.

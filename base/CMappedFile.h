@@ -9,7 +9,8 @@
 
 namespace gw {
 
-/// The bytes of a regular file, mapped and not copied. Folders and devices are refused. An empty file maps to no bytes.
+/// The bytes of a regular file, mapped and not copied. Folders and devices are refused. An empty file maps to
+/// no bytes.
 class CMappedFile
 {
 public:

@@ -8,8 +8,8 @@
 namespace gw {
 
 /// Replaces a file in one step: bytes go to a private file in the same folder, and Commit renames it over the
-/// destination. Without a Commit, or when anything failed, the old file stays as it was and the private one is
-/// removed. A symbolic link is followed, an existing file's mode is kept.
+/// destination. Without a Commit, or when anything failed, the old file stays as it was and the private one
+/// is removed. A symbolic link is followed, an existing file's mode is kept.
 class CSafeFile
 {
 public:
@@ -18,8 +18,8 @@ public:
     CSafeFile(const CSafeFile&) = delete;
     CSafeFile& operator=(const CSafeFile&) = delete;
 
-    /// Starts writing beside a destination. False when the folder takes no file or the destination is none that may
-    /// be replaced (a folder, a read-only file).
+    /// Starts writing beside a destination. False when the folder takes no file or the destination is none
+    /// that may be replaced (a folder, a read-only file).
     bool Open(const std::string& path);
     /// Writes all bytes; false when the file system does not take them, and Commit will then fail too.
     bool Write(std::string_view text);
@@ -39,8 +39,8 @@ private:
     bool m_bFailed = false;
 };
 
-/// A private file name beside a path, for intermediate files: same folder, same extension, not existing. Empty when
-/// the folder takes no file. The file is created empty.
+/// A private file name beside a path, for intermediate files: same folder, same extension, not existing.
+/// Empty when the folder takes no file. The file is created empty.
 std::string CreatePrivateFile(const std::string& besidePath, std::string_view extension);
 
 } // namespace gw

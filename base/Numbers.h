@@ -16,13 +16,13 @@ enum class ENumber : uint8_t
     Unusual, ///< "nan", "inf", or a number too big for the type
 };
 
-/// The result of atof in the C locale, whatever the locale of the desktop: leading blanks and one sign are skipped,
-/// what follows the number is ignored, no number is 0.
+/// The result of atof in the C locale, whatever the locale of the desktop: leading blanks and one sign are
+/// skipped, what follows the number is ignored, no number is 0.
 double ParseDouble(std::string_view text);
 /// The same with a verdict, for readers that warn about or refuse odd numbers.
 double ParseDouble(std::string_view text, ENumber& kind);
-/// The result of sscanf with "%f" in the C locale; false, and value left alone, where no number stands. Parsed as
-/// 64 bits and narrowed.
+/// The result of sscanf with "%f" in the C locale; false, and value left alone, where no number stands.
+/// Parsed as 64 bits and narrowed.
 bool ScanFloat(std::string_view text, float& value);
 bool ScanFloat(std::string_view text, float& value, ENumber& kind);
 /// The result of atoi: leading blanks, a sign, digits; 0 for no digits. Beyond 32 bits it is the nearest end.
@@ -30,15 +30,15 @@ int32_t ParseInt(std::string_view text);
 /// The result of sscanf with "%d"; false, and value left alone, where no digits stand.
 bool ScanInt(std::string_view text, int32_t& value);
 
-/// A number in a row of text, read from where it starts. For inner loops: `text` begins at a token's first character
-/// and `end` is the token's end or any later separator; `next` receives the first character that is no part of the
-/// number. Narrowed from 64 bits.
+/// A number in a row of text, read from where it starts. For inner loops: `text` begins at a token's first
+/// character and `end` is the token's end or any later separator; `next` receives the first character that is
+/// no part of the number. Narrowed from 64 bits.
 float ReadFloat(const char* text, const char* end, const char*& next, ENumber& kind);
 
 /// The most bytes that AppendFixed6 writes: sign, 39 digits, point, 6 digits.
 inline constexpr size_t kFixed6Bytes = 48;
-/// Writes a number as "%f" does in the C locale ("-0.000000", "inf", "-nan" included) and answers the end of it.
-/// Exact, also where a float's decimal expansion is cut.
+/// Writes a number as "%f" does in the C locale ("-0.000000", "inf", "-nan" included) and answers the end of
+/// it. Exact, also where a float's decimal expansion is cut.
 char* WriteFixed6(char* out, float value);
 /// The most bytes that WriteInt writes.
 inline constexpr size_t kIntBytes = 12;

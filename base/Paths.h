@@ -39,8 +39,8 @@ bool IsReadOnly(const std::string& path);
 bool CreateFolder(const std::string& path);
 bool DeleteFile(const std::string& path);
 
-/// The names of the regular files in a folder whose extension (dot included) fits without regard to case, in name
-/// order, so that a run is the same everywhere.
+/// The names of the regular files in a folder whose extension (dot included) fits without regard to case, in
+/// name order, so that a run is the same everywhere.
 std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
 
 /// The folder of the running program with its trailing separator.

@@ -26,7 +26,8 @@ bool NextLine(std::string_view& rest, std::string_view& line);
 /// The text behind a UTF-8 byte order mark, or the text itself.
 std::string_view SkipByteOrderMark(std::string_view text);
 
-/// A text as it may be printed: control characters as \xNN, so that a name in a file cannot command a terminal.
+/// A text as it may be printed: control characters as \xNN, so that a name in a file cannot command a
+/// terminal.
 std::string Printable(std::string_view text);
 /// The candidate nearest to a name by edit distance without regard to case, or empty when none is near.
 std::string NearestName(std::string_view name, const std::vector<std::string>& candidates);

@@ -9,7 +9,7 @@ Mat3 operator*(const Mat3& a, const Mat3& b)
     Mat3 out;
     for (int row = 0; row < 3; ++row)
     {
-        const float* r = &a.m[3 * row];
+        const float* r = a.m + 3 * static_cast<ptrdiff_t>(row);
         for (int column = 0; column < 3; ++column)
             out.m[3 * row + column] = r[0] * b.m[column] + r[1] * b.m[3 + column] + r[2] * b.m[6 + column];
     }

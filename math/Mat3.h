@@ -2,6 +2,8 @@
 
 #include "Vec3.h"
 
+#include <cstddef>
+
 namespace gw {
 
 /// A rotation or row basis: nine floats, row-major, element m[3r + c]. Rows multiply from the left; in A · B
@@ -10,12 +12,17 @@ struct Mat3
 {
     float m[9];
 
-    Vec3 Row(int row) const { return {m[3 * row], m[3 * row + 1], m[3 * row + 2]}; }
+    Vec3 Row(int row) const
+    {
+        const float* r = m + 3 * static_cast<ptrdiff_t>(row);
+        return {r[0], r[1], r[2]};
+    }
     void SetRow(int row, const Vec3& v)
     {
-        m[3 * row] = v.x;
-        m[3 * row + 1] = v.y;
-        m[3 * row + 2] = v.z;
+        float* r = m + 3 * static_cast<ptrdiff_t>(row);
+        r[0] = v.x;
+        r[1] = v.y;
+        r[2] = v.z;
     }
     /// Exact comparison, element by element.
     friend bool operator==(const Mat3&, const Mat3&) = default;

@@ -27,7 +27,7 @@ Mat4 operator*(const Mat4& a, const Mat4& b)
     Mat4 out;
     for (int row = 0; row < 4; ++row)
     {
-        const float* r = &a.m[4 * row];
+        const float* r = a.m + 4 * static_cast<ptrdiff_t>(row);
         for (int column = 0; column < 4; ++column)
             out.m[4 * row + column] = r[0] * b.m[column] + r[1] * b.m[4 + column] + r[2] * b.m[8 + column] +
                                       r[3] * b.m[12 + column];

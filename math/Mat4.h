@@ -10,7 +10,11 @@ struct Mat4
     float m[16];
 
     /// The first three elements of a row; row 3 is the translation.
-    Vec3 Row(int row) const { return {m[4 * row], m[4 * row + 1], m[4 * row + 2]}; }
+    Vec3 Row(int row) const
+    {
+        const float* r = m + 4 * static_cast<ptrdiff_t>(row);
+        return {r[0], r[1], r[2]};
+    }
     Vec3 Translation() const { return Row(3); }
     void SetTranslation(const Vec3& v)
     {

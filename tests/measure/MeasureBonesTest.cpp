@@ -79,6 +79,25 @@ TEST(MeasureConversion, DirectionLeadsToTheNextJointThatIsAway)
     }
 }
 
+TEST(MeasureConversion, ACollarThatDrivesATorsoIsMeasuredAsATorso)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    std::vector<BonePair> pairs = PairByName(source, result);
+    for (BonePair& pair : pairs)
+    {
+        if (pair.target == &result.Bone("UpperTorso"))
+            pair.source = &source.Bone("LUpperArm");
+    }
+    const auto leaning = [](CMadeFigure& figure, int) { figure.Turn("UpperTorso", kVec3UnitX, 9.0); };
+    const MotionClip clip = source.Record(5, kStill);
+    const BoneMeasures torso =
+        BoneOf(MeasureConversion(clip, result.Record(5, leaning), pairs), "UpperTorso");
+    EXPECT_EQ(torso.source, "LUpperArm");
+    EXPECT_EQ(torso.sourceChild, "Neck");
+    ExpectMeasured(torso.meanError, 9.0);
+}
+
 TEST(MeasureConversion, JitterIsTheSecondDifferenceOfDirections)
 {
     const auto shaking = [](double degrees) {
