@@ -51,8 +51,8 @@ prepare() {
 }
 
 demo() {
-  local bin=build/release/bin out
-  out=$(mktemp -d)
+  local bin=build/release/bin
+  out=$(mktemp -d) # not local: the trap looks at it when the script is over
   trap 'rm -rf "$out"' EXIT
   echo "\$ gaitwright convert examples/walk.bvh -o walk.Kinetra"
   "$bin/gaitwright" convert examples/walk.bvh -o "$out/walk.Kinetra"
