@@ -3,6 +3,7 @@
 #include "Angles.h"
 
 #include <cmath>
+#include <cstddef>
 
 namespace gw {
 
@@ -11,11 +12,11 @@ namespace {
 // The branch for rotations of half a turn or nearly so: starts from the largest diagonal element.
 Quat FromLargestDiagonal(const float* m)
 {
-    int i = m[0] < m[4] ? 1 : 0;
+    size_t i = m[0] < m[4] ? 1 : 0;
     if (m[4 * i] < m[8])
         i = 2;
-    const int j = (i + 1) % 3;
-    const int k = (i + 2) % 3;
+    const size_t j = (i + 1) % 3;
+    const size_t k = (i + 2) % 3;
 
     const double s = std::sqrt(static_cast<double>(m[4 * i]) - m[4 * j] - m[4 * k] + 1.0);
     const double r = 0.5 / s;
