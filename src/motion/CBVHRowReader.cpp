@@ -101,12 +101,16 @@ bool CBVHRowReader::RowsFit(size_t frameCount, size_t byteCount) const
 
 void CBVHRowReader::ReserveKeys(size_t frameCount, size_t byteCount)
 {
+    // Where rows will be short the arrays grow with what there is, and so they do for the rows of a second
+    // motion: each exact reservation is a copy.
     if (frameCount > (byteCount + 1) / (kBytesPerValue * m_kRow.size()))
-        return; // rows will be short, and the arrays grow with what there is
+        return;
     for (const Column& column : m_kColumns)
     {
-        column.joint->rotationKeys.reserve(column.joint->rotationKeys.size() + frameCount);
-        column.joint->positionKeys.reserve(column.joint->positionKeys.size() + frameCount);
+        if (!column.joint->rotationKeys.empty())
+            continue;
+        column.joint->rotationKeys.reserve(frameCount);
+        column.joint->positionKeys.reserve(frameCount);
     }
 }
 

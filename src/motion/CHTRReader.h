@@ -50,6 +50,7 @@ private:
     void LinkSegments();
     bool IndexSegments();
     bool ReadBaseLine(std::string_view line);
+    void ReserveRows(TKHTRSegment& segment);
     bool ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row);
     bool ReadNumbers(std::string_view text, std::span<float, 7> numbers, size_t& count);
     bool CheckFile();

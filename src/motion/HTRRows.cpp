@@ -77,12 +77,7 @@ bool CHTRReader::ReadSegment(std::string_view section)
     if (found == m_kFile.segmentOfName.end())
         return Fail(EFailure::UnknownSegment, name);
     TKHTRSegment& segment = *found->second;
-    const auto frames = static_cast<size_t>(std::max(m_kFile.numFrames, 0));
-    const size_t rows = segment.scales.size() + std::min(frames, m_kLines.BytesLeft() / kBytesPerRow);
-    segment.translations.reserve(rows);
-    segment.rotations.reserve(rows);
-    segment.scales.reserve(rows);
-
+    ReserveRows(segment);
     float row[7] = {0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 1.0f};
     for (std::string_view line; NextSectionLine(line);)
     {
@@ -91,6 +86,19 @@ bool CHTRReader::ReadSegment(std::string_view section)
         m_kLines.ForgetRead();
     }
     return true;
+}
+
+// Only where the file can hold as many rows for all segments, and not again for a second section of one name:
+// each exact reservation is a copy.
+void CHTRReader::ReserveRows(TKHTRSegment& segment)
+{
+    const auto frames = static_cast<size_t>(std::max(m_kFile.numFrames, 0));
+    if (!segment.scales.empty() ||
+        frames > m_kLines.ByteCount() / kBytesPerRow / m_kFile.segmentOfName.size())
+        return;
+    segment.translations.reserve(frames);
+    segment.rotations.reserve(frames);
+    segment.scales.reserve(frames);
 }
 
 // The frame number is passed over: rows count in the order of the file. A short row leaves the others as they

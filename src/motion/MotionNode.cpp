@@ -7,12 +7,12 @@
 
 namespace gw {
 
-bool KeyTimesFit(int frameCount, size_t nodeCount, size_t fileBytes)
+bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes)
 {
     // A row takes two bytes a node at the least, so that files of the usual kind stay far below this.
     constexpr size_t kTimesPerByte = 4;
     constexpr size_t kAnySize = size_t{1} << 22; // 16 MB, whatever a small file says
-    const auto frames = static_cast<size_t>(std::max(frameCount, 0));
+    const auto frames = static_cast<size_t>(std::max<int64_t>(frameCount, 0));
     return frames <= (fileBytes * kTimesPerByte + kAnySize) / std::max<size_t>(nodeCount, 1);
 }
 

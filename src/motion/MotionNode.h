@@ -3,6 +3,7 @@
 #include "CNode.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <string>
 #include <utility>
 #include <vector>
@@ -21,7 +22,7 @@ inline constexpr size_t kNameLimit = 255;
 
 /// Whether that many key times on that many nodes are in proportion to the file that asks for them: a count
 /// of frames is taken at its word, whatever rows follow.
-bool KeyTimesFit(int frameCount, size_t nodeCount, size_t fileBytes);
+bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes);
 
 /// Gives a node a new track without keys: times 0, 1, ... in frames, the frame time in seconds as frequency,
 /// and a rest matrix.

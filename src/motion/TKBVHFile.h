@@ -4,6 +4,7 @@
 #include "Vec3.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <memory>
 #include <string>
 #include <string_view>
@@ -56,6 +57,7 @@ struct TKBVHFile
     int frameCount = 0;
     float frameTime = 0.0f; ///< seconds
     size_t jointCount = 0;  ///< blocks of all kinds
+    int64_t rowsAsked = 0;  ///< frames of all motions in the file, of which there should be one
 
     /// The file's root joint, or null.
     TKBVHJoint* FirstRoot() const

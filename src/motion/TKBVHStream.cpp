@@ -83,10 +83,11 @@ bool TKBVHStream::ReadMotion(TKBVHFile& file)
     if (!ReadFrameTime(file))
         return false;
     const auto frameCount = static_cast<size_t>(std::max(file.frameCount, 0));
+    file.rowsAsked += std::max(file.frameCount, 1); // planning takes as long as a row
     CBVHRowReader rows(*root, m_kRecord);
     if (!rows.RowsFit(frameCount, lines.BytesLeft()))
         return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
-    if (!KeyTimesFit(file.frameCount, file.jointCount, lines.ByteCount()))
+    if (!KeyTimesFit(file.rowsAsked, file.jointCount, lines.ByteCount()))
         return m_kRecord.Fail(EFailure::BadCount, countLine, "Frames:");
     if (!rows.ReadRows(lines, frameCount))
         return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
