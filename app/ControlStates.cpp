@@ -6,6 +6,7 @@
 #include "CGaitConvertContent.h"
 #include "CProfileEditorDialog.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace gw {
@@ -88,7 +89,9 @@ bool HasSeveralFrames(const CMotionFile& motion)
 int ScrollValue(const Clock& clock)
 {
     const float value = clock.m_fEnd != 0.0f ? clock.m_fTime * kScrollRange / clock.m_fEnd : 0.0f;
-    return std::isfinite(value) ? static_cast<int>(std::lround(value)) : 0;
+    if (!std::isfinite(value))
+        return 0;
+    return static_cast<int>(std::lround(std::clamp(value, 0.0f, static_cast<float>(kScrollRange))));
 }
 
 } // namespace

@@ -9,35 +9,6 @@
 
 namespace gw {
 
-// ---- view
-
-void CScriptedView::SetScene(CNode* root, float frameStep, float lastFrame)
-{
-    m_kCalls.push_back(m_kNumber + (root ? ".SetScene " + std::string(root->NameView()) : ".SetScene null"));
-    m_spkScene = root;
-    m_bPlaying = false;
-    m_fTime = 0.0f;
-    m_fFrameStep = frameStep;
-    m_fLastFrame = lastFrame;
-}
-
-void CScriptedView::Seek(int position, int range)
-{
-    m_fTime = static_cast<float>(position) * End() / static_cast<float>(range);
-}
-
-void CScriptedView::Advance()
-{
-    if (!m_bPlaying)
-        return;
-    m_fTime += m_fFrameStep;
-    if (m_fTime >= End())
-    {
-        m_fTime = 0.0f;
-        m_bPlaying = false;
-    }
-}
-
 // ---- window
 
 EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButtons)
@@ -87,7 +58,7 @@ std::optional<CFolderChoice> CScriptedWindow::AskFolder(const CFileDialogSetup& 
 
 std::unique_ptr<CMotionView> CScriptedWindow::CreateView(std::string_view child)
 {
-    auto view = std::make_unique<CScriptedView>(m_kCalls, std::string(child.substr(4)));
+    auto view = std::make_unique<CWatchedView>();
     (child == "#cnt1" ? m_pkSource : m_pkResult) = view.get();
     return view;
 }

@@ -2,6 +2,7 @@
 
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
+#include "CGLView.h"
 #include "CGaitConvertContent.h"
 #include "CPlatform.h"
 #include "TempFolder.h"
@@ -15,43 +16,17 @@
 
 namespace gw {
 
-/// A view with a clock and no picture. Calls go into the window's list, with the view's number before them.
-class CScriptedView : public CMotionView
+/// The program's own view, which tells what it shows.
+class CWatchedView : public CGLView
 {
 public:
-    CScriptedView(std::vector<std::string>& calls, std::string number)
-        : m_kCalls(calls), m_kNumber(std::move(number))
+    void SetScene(CNode* root, float frameStep, float lastFrame) override
     {
+        m_spkShown = root;
+        CGLView::SetScene(root, frameStep, lastFrame);
     }
 
-    void SetScene(CNode* root, float frameStep, float lastFrame) override;
-    void SeekStart() override { m_fTime = 0.0f; }
-    void SeekEnd() override { m_fTime = End(); }
-    void Stop() override { m_bPlaying = false; }
-    void StepBack() override { m_fTime = std::max(0.0f, m_fTime - m_fFrameStep); }
-    void Play() override { m_bPlaying = true; }
-    void StepForward() override { m_fTime = std::min(End(), m_fTime + m_fFrameStep); }
-    void Seek(int position, int range) override;
-    void Advance() override;
-    bool IsPlaying() const override { return m_bPlaying; }
-    float GetTime() const override { return m_fTime; }
-    float GetFrameStep() const override { return m_fFrameStep; }
-    float GetLastFrame() const override { return m_fLastFrame; }
-    void SetHighlight(const std::string& boneName) override { m_kHighlight = boneName; }
-    void Repaint() override {}
-
-    Ref<CNode> m_spkScene;
-    std::string m_kHighlight;
-
-private:
-    float End() const { return m_fFrameStep * m_fLastFrame; }
-
-    std::vector<std::string>& m_kCalls;
-    std::string m_kNumber;
-    float m_fTime = 0.0f;
-    float m_fFrameStep = 0.0f;
-    float m_fLastFrame = 0.0f;
-    bool m_bPlaying = false;
+    Ref<CNode> m_spkShown;
 };
 
 /// A window that answers from a script and writes down what it was asked.
@@ -106,8 +81,8 @@ public:
     std::vector<std::string> m_kTitles;
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes
     std::vector<std::string> m_kCalls;
-    CScriptedView* m_pkSource = nullptr;
-    CScriptedView* m_pkResult = nullptr;
+    CWatchedView* m_pkSource = nullptr;
+    CWatchedView* m_pkResult = nullptr;
     int m_iWaits = 0;
     int m_iPlayFace = 0;
     int m_iScrollValue = 0;

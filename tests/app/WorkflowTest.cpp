@@ -146,7 +146,7 @@ TEST_F(ContentTest, AContainerStaysTheSourceUntilABatchRuns)
     const CNode* scene = m_kContent.SourceRoot();
     ASSERT_EQ(Open(Write("only/walk.bvh", BvhText(kPoserBones))), 1);
     EXPECT_EQ(m_kContent.SourceRoot(), scene);
-    EXPECT_EQ(m_kWindow.m_pkSource->m_spkScene.Get(), scene);
+    EXPECT_EQ(m_kWindow.m_pkSource->m_spkShown.Get(), scene);
 
     m_kWindow.m_kFolderAnswer = CFolderChoice{m_kFolder.Path("only/"), 1};
     m_kContent.RunBatch();
@@ -214,14 +214,14 @@ TEST_F(ContentTest, TheRestPoseStandsWhereTheMotionBegins)
     const CNode* root = FindBone(m_kContent.ResultMotion().restRoot.Get(), "LowerTorso");
     ASSERT_NE(root, nullptr);
     EXPECT_EQ(root->m_kMatrix.Translation(), kRootPosition);
-    EXPECT_EQ(m_kWindow.m_pkResult->m_spkScene, m_kContent.ResultMotion().motionRoot);
+    EXPECT_EQ(m_kWindow.m_pkResult->m_spkShown, m_kContent.ResultMotion().motionRoot);
 }
 
 TEST_F(ContentTest, WithoutATargetSkeletonTheSourceStillShows)
 {
     DeleteFile(m_kFolder.Path("data/base.htr"));
     EXPECT_EQ(Open(Write("walk.bvh", BvhText(kPoserBones))), 1);
-    EXPECT_NE(m_kWindow.m_pkSource->m_spkScene, nullptr);
+    EXPECT_NE(m_kWindow.m_pkSource->m_spkShown, nullptr);
     EXPECT_FALSE(m_kWindow.m_kEnabled["convert"]);
     ASSERT_FALSE(m_kWindow.m_kReports.empty());
     EXPECT_EQ(m_kWindow.m_kReports.front().path, m_kFolder.Path("data/base.htr"));
