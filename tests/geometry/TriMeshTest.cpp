@@ -52,9 +52,9 @@ TEST(VertexTable, VerticesAreNumberedByTheOrderOfTheirSignedKeys)
     for (const auto& list : lists)
         shuffle(list);
     const auto key = [&](size_t corner) {
-        std::vector<int32_t> indices;
-        for (const auto& list : lists)
-            indices.push_back(static_cast<int32_t>(list[corner]));
+        std::vector<int32_t> indices(lists.size());
+        std::ranges::transform(lists, indices.begin(),
+                               [=](const auto& list) { return int32_t(list[corner]); });
         return indices;
     };
     for (size_t corner = 0; corner < 36; ++corner)

@@ -217,7 +217,7 @@ TEST(CKeyframeControl, DamagedTracksEvaluateToWhatThereIs)
     std::vector<float> times = {5, 1, 4, 2, 3, kNaN, kInfinity, 0};
     for (int turn = 0; turn < 8; ++turn)
     {
-        std::ranges::rotate(times, times.begin() + 3);
+        std::rotate(times.begin(), times.begin() + 3, times.end());
         const Ref<CNode> node = TrackedNode(times);
         Track(*node).m_fBeginTime = -9.0f;
         Track(*node).m_fEndTime = 9.0f;
