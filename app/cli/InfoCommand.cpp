@@ -9,7 +9,7 @@
 #include "Text.h"
 #include "Words.h"
 
-#include <cmath>
+#include <algorithm>
 #include <cstdio>
 
 namespace gw {
@@ -31,7 +31,9 @@ Timing TimingOf(const CKeyframeControl* track)
 {
     if (!track)
         return {};
-    return {static_cast<int64_t>(track->m_kKeyTimes.size()), track->m_fEndTime, track->m_fFrequency};
+    const size_t frames = std::max({track->m_kKeyTimes.size(), track->m_kRotationTimes.size(),
+                                    track->m_kPositionTimes.size(), track->m_kScaleTimes.size()});
+    return {static_cast<int64_t>(frames), track->m_fEndTime, track->m_fFrequency};
 }
 
 // A batch run writes packages as .orn, so that the name does not tell.
