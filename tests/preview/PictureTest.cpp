@@ -116,6 +116,35 @@ TEST_F(PictureTest, SceneFollowsTheMouse)
     EXPECT_GT(CountColor(picture, kBoneColor), 0);
 }
 
+// A triangle that fills the same part of the view at any distance.
+TEST_F(PictureTest, ShowsWhatIsBetweenOneAndTenThousandAway)
+{
+    if (!m_bCanDraw)
+        return;
+    const struct
+    {
+        float distance;
+        bool shown;
+    } rows[] = {
+        {0.98f,     false},
+        {1.02f,     true },
+        {9'800.0f,  true },
+        {10'200.0f, false},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.distance);
+        const Ref<CNode> scene = MakeScene({});
+        CTriMesh& mesh = AttachBone(*scene, "bone", 1);
+        for (size_t i = 0; i < 3; ++i)
+            mesh.WorldXYZBuffer()[i] = (mesh.XYZBuffer()[i] * 0.02f - kVec3UnitZ) * row.distance;
+        CGLView view;
+        view.SetScene(scene.Get(), 1.0f, 1.0f);
+        view.m_kCamera.m_kLookAt = -kVec3UnitZ;
+        EXPECT_EQ(CountColor(Draw(view), kBoneColor) > 50, row.shown);
+    }
+}
+
 TEST_F(PictureTest, NoSizeKeepsTheOldProjection)
 {
     if (!m_bCanDraw)
