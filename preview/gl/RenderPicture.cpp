@@ -74,9 +74,7 @@ Grid GridOf(const PictureOptions& options)
 bool IsDrawable(const PictureOptions& options)
 {
     // Each part of a side needs a pixel.
-    const auto holds = [](int side, int parts) {
-        return side <= kLongestSide && parts >= 1 && parts <= side;
-    };
+    const auto holds = [](int side, int parts) { return side <= kLongestSide && parts <= side; };
     if (options.motions.empty() || options.motions.size() > kLongestSide || options.poseCount < 1)
         return false;
     const Grid grid = GridOf(options);

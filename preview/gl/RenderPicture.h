@@ -40,7 +40,8 @@ enum class EPictureAnswer : uint8_t
 inline constexpr int kLongestSide = 8192; ///< 200 MB of pixels; software renderers take no more
 
 /// Draws without any display. Each pose is in the middle of its view and as large as all of it can be seen,
-/// the poses of a motion at one scale. The motions stand evaluated at the last pose afterwards.
+/// the poses of a motion at one scale. The motions stand evaluated at the last pose
+/// afterwards. Without Done the picture is left as it was.
 EPictureAnswer RenderPicture(const PictureOptions& options, RgbPicture& picture);
 
 } // namespace gw

@@ -6,8 +6,6 @@
 #include "PreviewScene.h"
 
 #include <GL/gl.h>
-#include <algorithm>
-#include <array>
 #include <gtest/gtest.h>
 
 namespace gw {
