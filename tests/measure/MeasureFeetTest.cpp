@@ -137,9 +137,9 @@ TEST(FindContacts, ThresholdsHaveASlack)
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.what);
-        std::vector<Vec3> places;
+        std::vector<Vec3> places(kFrameCount);
         for (int f = 0; f < kFrameCount; ++f)
-            places.push_back(row.place(f));
+            places[static_cast<size_t>(f)] = row.place(f);
         const FloorPath ankle{places, 0.0f};
         std::vector<int> borders;
         for (const Contact& contact : FindContacts({&ankle, 1}, 800.0, 1.0 / row.rate))
