@@ -3,7 +3,7 @@ import json
 import struct
 
 from harness import DONE, FAILED, CliTest, main
-from made import HTR, Container, moved, one_bone_scene
+from made import HTR, Container, moved, one_bone_scene, profile
 
 
 def skeleton():
@@ -71,6 +71,21 @@ class Containers(CliTest):
         self.assertEqual(track["fields"]["m_fFrequency"], 0.5)
         self.assertEqual(hips["fields"]["m_kMatrix"], moved(0, 90, 0))
         self.assertEqual((told["frames"], told["rate"], told["seconds"]), (3, 2, 1))
+
+    def test_a_list_of_one_stays_a_list(self):
+        self.write("scene.orn", one_bone_scene(frames=1))
+        track = json.loads(self.run_program("info", "scene.orn", "--json").out)["objects"][1]
+        self.assertEqual(track["fields"]["m_kPositionKeys"], [[0, 90, 0]])
+        self.assertEqual(track["fields"]["m_kKeyTimes"], [0])
+
+    def test_a_scene_that_ends_before_it_begins_is_not_converted(self):
+        self.write("hip.prf", profile("Hip", [("hip", "LowerTorso")]))
+        for frames, code in ((3, DONE), (0, FAILED)):
+            self.write("scene.orn", one_bone_scene(frames))
+            result = self.with_assets("convert", "scene.orn", "-o", "%d.htr" % frames, "--profile", "hip.prf")
+            self.assertEqual(result.code, code, result.err)
+        self.assert_words(result, ["scene.orn", "no frames"])
+        self.assertEqual(self.files(), ["3.htr", "hip.prf", "scene.orn"])
 
     def test_json_stays_json_whatever_a_file_holds(self):
         self.write("odd.orn", odd_numbers())

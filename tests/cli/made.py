@@ -119,7 +119,7 @@ class Container:
         return self.record("CKeyframeControl", number, name, (0, 0, 0), body, False)
 
 
-def one_bone_scene():
-    """A bone that rises for three frames of half a second."""
+def one_bone_scene(frames=3):
+    """A bone that rises, frames of half a second; without frames it ends before it begins."""
     scene = Container().node(1, "hip", control=2, root=True)
-    return scene.track(2, 1, [(0, 90, 0), (0, 91, 0), (0, 92, 0)]).bytes
+    return scene.track(2, 1, [(0, 90 + frame, 0) for frame in range(frames)]).bytes

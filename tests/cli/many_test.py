@@ -124,13 +124,24 @@ class Told(CliTest):
         self.assertIn(("source", "Hips", "hip"),
                       {(m["side"], m["bone"], m["nearest"]) for m in fits["Max BVH"]["missing"]})
 
-    def test_a_users_own_profile_is_found_by_its_name(self):
+    def install(self, name, rows):
         self.environment["XDG_CONFIG_HOME"] = str(self.folder / "home" / ".config")
         self.write("home/.config/user-dirs.dirs", 'XDG_DOCUMENTS_DIR="$HOME/Papers"\n')
-        self.write("home/Papers/BVH Profile/Custom0.prf", profile("Mine", [("hip", "LowerTorso")]))
+        self.write("home/Papers/BVH Profile/%s.prf" % name, profile(name, rows))
+
+    def test_a_users_own_profile_is_found_by_its_name(self):
+        self.install("Mine", [("hip", "LowerTorso")])
         self.assertIn("Mine (own", self.succeed("profiles").out)
         result = self.succeed("convert", WALK, "-o", "a.htr", "--profile", "mine", "--json")
         self.assertEqual(json.loads(result.out)["profile"], "Mine")
+
+    def test_where_no_stock_profile_fits_the_one_with_most_rows_is_taken(self):
+        self.install("A little", [("Hips", "LowerTorso")])
+        self.install("Best", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")])
+        self.install("Too much", [("Hips", "LowerTorso"), ("Chest", "UpperTorso"), ("Skull", "Head")])
+        self.write("small.bvh", BVH)
+        result = self.succeed("convert", "small.bvh", "--json")
+        self.assertEqual(json.loads(result.out)["profile"], "Best")
 
     def test_a_result_is_measured_in_either_form(self):
         self.succeed("convert", WALK, "-o", "a.htr")
