@@ -84,9 +84,9 @@ TEST(CControl, MapsTimesByFrequencyPhaseAndCycle)
 TEST(FindKeys, AnyOrderOfPlayFindsTheSameSpan)
 {
     const std::vector<float> times = {0, 1, 2, 4, 8, 16, 32, 33};
-    std::vector<float> play;
-    for (int step = 0; step < 100; ++step)
-        play.push_back(-2.0f + 0.375f * static_cast<float>(step));
+    std::vector<float> play(100);
+    for (size_t step = 0; step < play.size(); ++step)
+        play[step] = -2.0f + 0.375f * static_cast<float>(step);
     play.insert(play.end(), play.rbegin(), play.rend());
     for (const float time : {17.0f, 3.0f, 40.0f, -1.0f, 8.0f, 32.0f, 1.0f, 8.0f, 8.0f})
         play.push_back(time);
