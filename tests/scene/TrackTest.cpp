@@ -87,7 +87,8 @@ TEST(FindKeys, AnyOrderOfPlayFindsTheSameSpan)
     std::vector<float> play(100);
     for (size_t step = 0; step < play.size(); ++step)
         play[step] = -2.0f + 0.375f * static_cast<float>(step);
-    play.insert(play.end(), play.rbegin(), play.rend());
+    const std::vector<float> back(play.rbegin(), play.rend());
+    play.insert(play.end(), back.begin(), back.end());
     for (const float time : {17.0f, 3.0f, 40.0f, -1.0f, 8.0f, 32.0f, 1.0f, 8.0f, 8.0f})
         play.push_back(time);
     CKeyframeControl::Cursor cursor = 0;
