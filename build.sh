@@ -14,7 +14,8 @@ cd "$(dirname "$0")"
 packages_build=(g++ cmake ninja-build pkg-config ccache)
 packages_engine=(libcli11-dev nlohmann-json3-dev)
 packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libgl1-mesa-dri)
-packages_test=(libgtest-dev libgmock-dev locales python3)
+packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libgl1-mesa-dri fonts-dejavu-core)
+packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth)
 packages_bench=(libbenchmark-dev libassimp-dev python3 time)
 packages_lint=(clang-format clang-tidy)
 
@@ -47,7 +48,7 @@ run_tests() {
 }
 
 prepare() {
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_test[@]}" libbenchmark-dev
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" libbenchmark-dev
 }
 
 demo() {
@@ -82,13 +83,13 @@ asan)
   run_tests asan
   ;;
 bench)
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_test[@]}" "${packages_bench[@]}"
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
   build release
   build/release/bin/gaitwright_bench
   python3 bench/whole_process.py build/release/bin
   ;;
 lint)
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
   git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
   [ -f build/dev/build.ninja ] || cmake --preset dev >/dev/null
   git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet

@@ -1,0 +1,29 @@
+#pragma once
+
+#include <QDialog>
+
+namespace gw {
+
+class CBoneOffsetDialog;
+class CGaitConvertContent;
+class CPlatform;
+
+/// The window of the profile editor: shows what the model answers, forwards what the user does. Modeless; the
+/// main window's toggle shows and hides it.
+class CProfileEditorWindow : public QDialog
+{
+public:
+    /// Model, texts and questions are the content's; both it and the platform must outlive the window.
+    CProfileEditorWindow(CGaitConvertContent& content, CPlatform& platform, QWidget* owner);
+
+    /// Shows or hides the window as the model says: placement restored at the first showing, stored when it
+    /// is hidden.
+    void SetShown(bool shown);
+    /// The model changed: shows its present state soon, all changes until then at once.
+    void Refresh();
+    /// Runs the dialog that edits one row, modal to this window if it is visible, else to the owner. True on
+    /// OK.
+    bool RunBoneOffset(CBoneOffsetDialog& dialog);
+};
+
+} // namespace gw

@@ -1,0 +1,6 @@
+#include "RunDesktop.h"
+
+int main(int argc, char** argv)
+{
+    return gw::RunDesktop(argc, argv);
+}

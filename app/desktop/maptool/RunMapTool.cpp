@@ -1,0 +1,10 @@
+#include "RunMapTool.h"
+
+namespace gw {
+
+int RunMapTool(CPlatform&, const CLeftKeys&)
+{
+    return 0;
+}
+
+} // namespace gw

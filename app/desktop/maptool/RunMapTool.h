@@ -1,0 +1,12 @@
+#pragma once
+
+namespace gw {
+
+class CLeftKeys;
+class CPlatform;
+
+/// Shows the map tool as the program's only window until it is closed. The application must exist; answers
+/// its exit code.
+int RunMapTool(CPlatform& platform, const CLeftKeys& keys);
+
+} // namespace gw

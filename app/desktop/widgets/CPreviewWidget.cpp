@@ -1,0 +1,100 @@
+#include "CPreviewWidget.h"
+
+#include "CLeftKeys.h"
+#include "GLPainter.h"
+
+#include <QMouseEvent>
+#include <QOpenGLContext>
+#include <QPointer>
+#include <QSurfaceFormat>
+
+namespace gw {
+
+// The view and its widget may die in either order.
+class CPreviewWidget::CWidgetView : public CGLView
+{
+public:
+    explicit CWidgetView(CPreviewWidget* widget) : m_kWidget(widget)
+    {
+        SetRepaint([this] {
+            if (m_kWidget)
+                m_kWidget->update();
+        });
+    }
+    ~CWidgetView() override
+    {
+        if (m_kWidget && m_kWidget->m_pkView == this)
+            m_kWidget->m_pkView = nullptr;
+    }
+
+private:
+    QPointer<CPreviewWidget> m_kWidget;
+};
+
+CPreviewWidget::CPreviewWidget(const CLeftKeys& keys, QWidget* parent) : QOpenGLWidget(parent), m_kKeys(keys)
+{
+}
+
+std::unique_ptr<CGLView> CPreviewWidget::MakeView()
+{
+    auto view = std::make_unique<CWidgetView>(this);
+    m_pkView = view.get();
+    return view;
+}
+
+void CPreviewWidget::initializeGL()
+{
+    InitGL();
+}
+
+void CPreviewWidget::resizeGL(int width, int height)
+{
+    const qreal ratio = devicePixelRatio();
+    ResizeGL(qRound(width * ratio), qRound(height * ratio));
+}
+
+void CPreviewWidget::paintGL()
+{
+    CGLView empty;
+    PaintGL(m_pkView ? *m_pkView : empty);
+}
+
+void CPreviewWidget::mousePressEvent(QMouseEvent* event)
+{
+    const QPoint at = event->position().toPoint();
+    if (m_pkView && event->button() == Qt::LeftButton)
+        m_pkView->MouseDown(at.x(), at.y());
+}
+
+void CPreviewWidget::mouseReleaseEvent(QMouseEvent* event)
+{
+    if (m_pkView && event->button() == Qt::LeftButton)
+        m_pkView->MouseUp();
+}
+
+void CPreviewWidget::mouseMoveEvent(QMouseEvent* event)
+{
+    const QPoint at = event->position().toPoint();
+    if (m_pkView)
+        m_pkView->MouseMove(at.x(), at.y(), {m_kKeys.IsDown(EKey::LeftCtrl), m_kKeys.IsDown(EKey::LeftShift)});
+}
+
+bool HasOpenGL()
+{
+    QOpenGLContext context;
+    return context.create();
+}
+
+void RequestPreviewFormat()
+{
+    QSurfaceFormat format;
+    format.setVersion(2, 1);
+    format.setProfile(QSurfaceFormat::CompatibilityProfile);
+    format.setRedBufferSize(kPixelFormat.redBits);
+    format.setGreenBufferSize(kPixelFormat.greenBits);
+    format.setBlueBufferSize(kPixelFormat.blueBits);
+    format.setDepthBufferSize(kPixelFormat.depthBits);
+    QSurfaceFormat::setDefaultFormat(format);
+}
+
+} // namespace gw
