@@ -64,6 +64,10 @@ public:
     virtual void Report(const CReport&) {}
     /// A batch run takes up a file: number from 0 on, number of files, path.
     virtual void ShowBatchFile(size_t, size_t, const std::string&) {}
+    /// Whether an operation has run so long that its user should see how far it is.
+    virtual bool IsProgressDue() { return false; }
+    /// Paints what is due, in the midst of an operation: no key, no click and no timer comes through.
+    virtual void StayPainted() {}
     virtual void BeginWaitCursor() {}
     virtual void EndWaitCursor() {}
     /// Draws the window at once, where a dialog has left its mark.

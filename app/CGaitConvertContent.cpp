@@ -15,6 +15,7 @@ namespace gw {
 namespace {
 
 constexpr std::string_view kContainerExtension = ".orn";
+constexpr std::string_view kProfileExtension = ".prf";
 constexpr const char* kFolderSetting = "MotionSource";
 
 void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
@@ -68,19 +69,39 @@ int CGaitConvertContent::OpenSource()
     if (!ConfirmDiscard())
         return 0;
     const auto path = m_kWindow.AskOpenFile({"bvh", Message(kOpenFilterMessage), SourceFolder()});
-    if (!path)
-        return 1;
+    return path ? Open(*path) : 1;
+}
+
+int CGaitConvertContent::OpenFile(const std::string& path)
+{
+    return ConfirmDiscard() ? Open(path) : 0;
+}
+
+int CGaitConvertContent::OpenDropped(const std::string& path)
+{
+    if (FolderExists(path))
+        return RunBatch(WithSeparator(path));
+    if (!HasExtension(path, kProfileExtension))
+        return OpenFile(path);
+    UseProfileFile(path);
+    UpdateControls();
+    return 1;
+}
+
+int CGaitConvertContent::Open(const std::string& path)
+{
     m_kWindow.RedrawFrame();
     const CWaitCursor wait(m_kWindow);
     if (m_pkSourceView)
         m_pkSourceView->Stop();
-    if (!LoadSource(*path))
+    if (!LoadSource(path))
     {
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
         return 0;
     }
-    m_kSourcePath = *path;
-    RememberFolder(*path);
+    m_kSourcePath = path;
+    RememberFolder(path);
+    AddRecentFile(path);
     ShowSource();
     PickStockProfile();
     if (m_pkProfile)
@@ -177,6 +198,12 @@ EAnswer CGaitConvertContent::ShowMessage(int id, EButtons buttons, std::span<con
 }
 
 void CGaitConvertContent::SetTitle(const std::string& text)
+{
+    m_kTitle = text;
+    ShowTitle(text);
+}
+
+void CGaitConvertContent::ShowTitle(const std::string& text)
 {
     const std::string product = Message(kTitleMessage);
     m_kWindow.SetChildText("#title", text.empty() ? product : product + " - " + text);

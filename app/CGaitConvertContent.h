@@ -50,9 +50,15 @@ public:
     /// The command of a clicked child. True when the click is to be passed on to the window's own handling.
     bool ChildClick(std::string_view child);
     int OpenSource();
+    /// What OpenSource does once a path was chosen: a file of the recent ones, or of the command line.
+    int OpenFile(const std::string& path);
+    /// What was dropped on the window: a motion opens, a folder offers a batch run, a profile is selected.
+    int OpenDropped(const std::string& path);
     int ConvertMotion();
     int SaveResult();
     int RunBatch();
+    /// The same, with the dialog beginning in a folder; an empty one means that of the last source.
+    int RunBatch(const std::string& folder);
     /// The result, written and packaged as the path's extension says. Replaces what is there. False when
     /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
     /// reported.
@@ -106,6 +112,8 @@ public:
     /// The window's title: the product's name, and behind it a text if there is one.
     void SetTitle(const std::string& text);
     CBoneMapProfile* Profile() const { return m_pkProfile; }
+    /// The sources that were opened last, the newest first.
+    std::vector<std::string> RecentFiles() const;
     CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
     /// The root of the open source, be it a motion file's or a container's; null when nothing is open.
     CNode* SourceRoot() const;
@@ -118,12 +126,17 @@ private:
     struct Command;
     enum class EBatchStep : uint8_t;
 
+    // RecentFiles.cpp
+    void AddRecentFile(const std::string& path);
+
     // CGaitConvertContent.cpp
+    int Open(const std::string& path);
     bool LoadSource(const std::string& path);
     bool LoadSourceScene(const std::string& path);
     bool LoadMotion(CMotionFile& motion, const std::string& path);
     void ShowSource();
     std::string SourceFolder() const;
+    void ShowTitle(const std::string& text);
     void RememberFolder(const std::string& path);
     std::string BaseFile() { return ExeFile("base.htr"); }
     void Report(const std::string& path, const CFailureRecord& record);
@@ -131,6 +144,7 @@ private:
     // ConvertMotion.cpp
     bool PrepareRetargeter();
     void Retarget(const SourceTiming& timing, bool useLegs);
+    void ShowProgress(size_t done, size_t total);
     void NormalizeBasePose();
     void ReportMisfit();
     bool ReportMissingBones();
@@ -191,6 +205,7 @@ private:
     std::string m_kPoserProfileName;
     std::string m_kMaxProfileName;
     std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
+    std::string m_kTitle;                     ///< what SetTitle was given last
     bool m_bConverted = false;                ///< a conversion has been made for the open source
     bool m_bSaved = true;                     ///< the result has been saved, or there was none
     CBoneMapProfile* m_pkProfile = nullptr;   ///< the editor's

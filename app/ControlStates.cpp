@@ -94,6 +94,19 @@ int ScrollValue(const Clock& clock)
     return static_cast<int>(std::lround(std::clamp(value, 0.0f, static_cast<float>(kScrollRange))));
 }
 
+// Where a view stands: frame, last frame and seconds. A view's step is one over the frame time.
+std::string PlaceText(const CMotionView* view)
+{
+    if (!view || !(view->GetFrameStep() > 0.0f) || !(view->GetLastFrame() > 0.0f))
+        return {};
+    const float frame = std::round(view->GetTime() / view->GetFrameStep());
+    const std::string hundredths = std::to_string(std::llround(100.0f * frame / view->GetFrameStep()));
+    const std::string digits = std::string(3 - std::min<size_t>(hundredths.size(), 3), '0') + hundredths;
+    return "frame " + std::to_string(std::llround(frame)) + " of " +
+           std::to_string(std::llround(view->GetLastFrame())) + "   " + digits.substr(0, digits.size() - 2) +
+           '.' + digits.substr(digits.size() - 2) + " s";
+}
+
 } // namespace
 
 uint32_t CGaitConvertContent::ControlFacts() const
@@ -130,6 +143,7 @@ void CGaitConvertContent::UpdateControls()
     m_kWindow.SetChildSecondState("play", plays);
     m_kWindow.SetChildButtonState("%adv", m_pkProfileDialog && m_pkProfileDialog->IsVisible());
     m_kWindow.SetChildScrollValue("|playbar", ScrollValue(Clock(m_pkSourceView.get())));
+    m_kWindow.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
     ShowHighlights();
 }
 

@@ -32,7 +32,13 @@ enum class CGaitConvertContent::EBatchStep : uint8_t
 
 int CGaitConvertContent::RunBatch()
 {
-    const auto choice = m_kWindow.AskFolder({{}, kFilter, SourceFolder()});
+    return RunBatch({});
+}
+
+int CGaitConvertContent::RunBatch(const std::string& initialFolder)
+{
+    const auto choice =
+        m_kWindow.AskFolder({{}, kFilter, initialFolder.empty() ? SourceFolder() : initialFolder});
     if (!choice)
         return 0;
     m_kWindow.RedrawFrame();
@@ -65,6 +71,7 @@ void CGaitConvertContent::ShowBatchFile(const std::string& path, size_t index, s
     SetTitle(FormatText(Message(kBatchTitleMessage), arguments));
     m_kWindow.ShowBatchFile(index, count, path);
     ForViews(&CMotionView::Stop);
+    m_kWindow.StayPainted();
 }
 
 CGaitConvertContent::EBatchStep CGaitConvertContent::ConvertFile(const std::string& path)

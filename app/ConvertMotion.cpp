@@ -75,12 +75,23 @@ bool CGaitConvertContent::PrepareRetargeter()
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
 {
+    m_kRetargeter->SetProgress([this](size_t done, size_t total) { ShowProgress(done, total); });
     m_kRetargeter->Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
     Report(m_kSourcePath, m_kRetargeter->Record());
     const SourceTiming result = TimingOf(m_kResultMotion);
     if (m_pkResultView)
         m_pkResultView->SetScene(m_kResultMotion.motionRoot.Get(), result.FrameStep(), result.lastFrame);
     NormalizeBasePose();
+    ShowTitle(m_kTitle);
+}
+
+void CGaitConvertContent::ShowProgress(size_t done, size_t total)
+{
+    if (!m_kWindow.IsProgressDue())
+        return;
+    const std::string percent = std::to_string(100 * done / total) + " %";
+    ShowTitle(m_kTitle.empty() ? "Converting " + percent : m_kTitle + ", " + percent);
+    m_kWindow.StayPainted();
 }
 
 // Puts the rest pose's root where the motion's root begins; rotation and scale stay.

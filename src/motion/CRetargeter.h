@@ -5,6 +5,8 @@
 #include "Mat3.h"
 #include "Vec3.h"
 
+#include <cstddef>
+#include <functional>
 #include <map>
 #include <string>
 #include <vector>
@@ -67,6 +69,9 @@ public:
     bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition,
                   bool resetOrigin, bool useLegs);
 
+    /// What a run calls now and then, with the frames done and their number.
+    void SetProgress(std::function<void(size_t, size_t)> progress) { m_kProgress = std::move(progress); }
+
     /// What the last run was not happy with.
     const CFailureRecord& Record() const { return m_kRecord; }
 
@@ -83,6 +88,7 @@ private:
     CNode* m_pkSourceRoot = nullptr;
     CNode* m_pkTargetRoot = nullptr;
     CFailureRecord m_kRecord;
+    std::function<void(size_t, size_t)> m_kProgress;
 };
 
 } // namespace gw

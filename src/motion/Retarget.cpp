@@ -27,6 +27,8 @@ constexpr float kFrameLimit = 16777216.0f;
 constexpr uint64_t kResultBytesLimit = uint64_t{1} << 31;
 constexpr uint64_t kKeyBytes = sizeof(float) + sizeof(Quat) + 2 * sizeof(Vec3);
 
+constexpr size_t kProgressFrames = 64;
+
 // Brings the source nodes that a conversion looks at, and those above them, to a time, each once. The rest of
 // the source (fingers, meshes, bounds) is left as it is until the end.
 class CSourceSampler
@@ -250,6 +252,8 @@ void CRetargeter::PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeC
         WriteKeys(bones, tracks, frame);
         if (useLegs)
             legs.Plant(frame, scale, tracks);
+        if (m_kProgress && frame % kProgressFrames == 0)
+            m_kProgress(frame, frameCount);
     }
 }
 

@@ -25,6 +25,14 @@ void CScriptedWindow::Report(const CReport& report)
     m_kCalls.push_back("report " + report.code + (report.name.empty() ? "" : ' ' + report.name));
 }
 
+void CScriptedWindow::SetChildText(std::string_view child, const std::string& text)
+{
+    if (child == "#title")
+        m_kTitles.push_back(text);
+    else if (child == "#frame")
+        m_kPlace = text;
+}
+
 std::string CScriptedWindow::TakeWords()
 {
     std::string words;

@@ -52,7 +52,7 @@ public:
     void SetChildButtonState(std::string_view, bool on) override { m_bButtonState = on; }
     bool GetChildButtonState(std::string_view) const override { return m_bButtonState; }
     void SetChildScrollValue(std::string_view, int value) override { m_iScrollValue = value; }
-    void SetChildText(std::string_view, const std::string& text) override { m_kTitles.push_back(text); }
+    void SetChildText(std::string_view child, const std::string& text) override;
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
     CCntComboExControl& ProfileCombo() override { return m_kList; }
     void SetTimer(int id, int milliseconds) override;
@@ -79,6 +79,7 @@ public:
     std::map<std::string, bool> m_kEnabled;
     std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"
     std::vector<std::string> m_kTitles;
+    std::string m_kPlace;              ///< frame and seconds beside the bar
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes
     std::vector<std::string> m_kCalls;
     CWatchedView* m_pkSource = nullptr;

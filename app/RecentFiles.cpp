@@ -1,0 +1,40 @@
+// The sources that were opened last.
+
+#include "CGaitConvertContent.h"
+#include "CPlatform.h"
+#include "Text.h"
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kRecentSetting = "RecentFiles";
+constexpr size_t kRecentCount = 8;
+
+} // namespace
+
+std::vector<std::string> CGaitConvertContent::RecentFiles() const
+{
+    const std::string setting = m_kPlatform.ReadSetting(kRecentSetting);
+    std::vector<std::string> paths;
+    std::string_view rest = setting;
+    for (std::string_view line; paths.size() < kRecentCount && NextLine(rest, line);)
+    {
+        if (!line.empty())
+            paths.emplace_back(line);
+    }
+    return paths;
+}
+
+void CGaitConvertContent::AddRecentFile(const std::string& path)
+{
+    std::vector<std::string> paths = RecentFiles();
+    std::erase(paths, path);
+    paths.insert(paths.begin(), path);
+    std::string setting;
+    for (size_t i = 0; i < paths.size() && i < kRecentCount; ++i)
+        setting += paths[i] + '\n';
+    m_kPlatform.WriteSetting(kRecentSetting, setting);
+}
+
+} // namespace gw
