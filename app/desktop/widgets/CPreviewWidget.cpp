@@ -76,7 +76,8 @@ void CPreviewWidget::mouseMoveEvent(QMouseEvent* event)
 {
     const QPoint at = event->position().toPoint();
     if (m_pkView)
-        m_pkView->MouseMove(at.x(), at.y(), {m_kKeys.IsDown(EKey::LeftCtrl), m_kKeys.IsDown(EKey::LeftShift)});
+        m_pkView->MouseMove(at.x(), at.y(),
+                            {m_kKeys.IsDown(EKey::LeftCtrl), m_kKeys.IsDown(EKey::LeftShift)});
 }
 
 bool HasOpenGL()

@@ -1,0 +1,269 @@
+#include "CContent.h"
+
+#include "CGLView.h"
+#include "CGaitConvertContent.h"
+#include "CLeftKeys.h"
+#include "CPlaybar.h"
+#include "CPreviewWidget.h"
+#include "CProfileEditorWindow.h"
+#include "CTitleLabel.h"
+#include "FaceChildren.h"
+#include "FailureWords.h"
+#include "QtText.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QLabel>
+#include <QMouseEvent>
+
+namespace gw {
+
+namespace {
+
+constexpr int kProgressMilliseconds = 150; // what is over before this needs no progress
+constexpr int kCornerSide = 32;            // pixels of the corner with the icon
+
+} // namespace
+
+CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : QWidget(frame), m_kKeys(keys)
+{
+    setObjectName(QStringLiteral("face"));
+    setAttribute(Qt::WA_StyledBackground);
+    setFixedSize(skin.Size());
+    for (const CSkinChild& child : skin.Children())
+    {
+        QWidget* const widget = MakeFaceChild(child, skin, keys, this);
+        m_kChildren[child.name] = widget;
+        Connect(widget);
+    }
+    m_kCombo.SetChildren(Child<QComboBox>("#format"), Child<QAbstractButton>("pull"));
+    m_kCombo.SetNotify([this](int code) { m_pkLogic->OnCntCommand(code); });
+    ShowNotes();
+}
+
+CContent::~CContent() = default;
+
+// The child of a name, or null where it is of another kind or not there.
+template <class Widget>
+Widget* CContent::Child(std::string_view name) const
+{
+    const auto found = m_kChildren.find(name);
+    return found == m_kChildren.end() ? nullptr : dynamic_cast<Widget*>(found->second);
+}
+
+void CContent::Connect(QWidget* child)
+{
+    if (auto* button = dynamic_cast<CFaceButton*>(child))
+        connect(button, &QPushButton::clicked, this, [this, button] { Click(ToUtf8(button->objectName())); });
+    else if (auto* title = dynamic_cast<CTitleLabel*>(child))
+        title->m_kMouseDown = [this](const QPoint& position) { m_kTitleDown(position); };
+    else
+        ConnectBar(child);
+}
+
+void CContent::ConnectBar(QWidget* child)
+{
+    auto* const bar = dynamic_cast<CPlaybar*>(child);
+    if (!bar)
+        return;
+    const std::string name = ToUtf8(bar->objectName());
+    bar->m_kMouseDown = [this, name] { m_pkLogic->ChildMouseDown(name); };
+    bar->m_kScroll = [this, name](int value) { m_pkLogic->ChildScroll(name, value); };
+    bar->m_kMouseUp = [this, name] { m_pkLogic->ChildMouseUp(name); };
+}
+
+void CContent::Click(const std::string& child)
+{
+    if (child == "minimise")
+        window()->showMinimized();
+    else if (child == "notes")
+        ShowMessageBox(0, ToUtf8(QCoreApplication::translate("Face", "Notes on the last step")),
+                       EButtons::OK);
+    else if (m_pkLogic)
+        m_pkLogic->ChildClick(child);
+}
+
+bool CContent::IsBusy() const
+{
+    return m_iWaits > 0 || QApplication::activeModalWidget();
+}
+
+void CContent::FrameAll()
+{
+    for (const char* name : {"#cnt1", "#cnt2"})
+    {
+        auto* const surface = Child<CPreviewWidget>(name);
+        if (!surface || !surface->View())
+            continue;
+        surface->View()->FrameAll();
+        surface->View()->Repaint();
+    }
+}
+
+void CContent::mousePressEvent(QMouseEvent* event)
+{
+    const QPoint place = event->position().toPoint();
+    if (event->button() == Qt::LeftButton && place.x() < kCornerSide && place.y() < kCornerSide)
+        m_kCornerDown(event->globalPosition().toPoint());
+}
+
+bool CContent::IsKeyDown(EKey key) const
+{
+    return m_kKeys.IsDown(key);
+}
+
+void CContent::Report(const CReport& report)
+{
+    m_kReports.push_back(report);
+}
+
+// One line for each thing that was reported; they are not shown twice.
+std::string CContent::TakeNotes()
+{
+    std::string text;
+    for (const CReport& report : m_kReports)
+        text += ReportLine(report) + '\n';
+    m_kReports.clear();
+    ShowNotes();
+    return text;
+}
+
+void CContent::ShowNotes()
+{
+    auto* const button = Child<QPushButton>("notes");
+    if (!button)
+        return;
+    const auto count = static_cast<int>(m_kReports.size());
+    button->setText(count == 1 ? tr(" 1 note") : tr(" %1 notes").arg(count));
+    button->setVisible(count > 0);
+}
+
+bool CContent::IsProgressDue()
+{
+    return m_iWaits > 0 && m_kSincePainted.hasExpired(kProgressMilliseconds);
+}
+
+void CContent::StayPainted()
+{
+    QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents | QEventLoop::ExcludeSocketNotifiers);
+    m_kSincePainted.start();
+}
+
+void CContent::BeginWaitCursor()
+{
+    if (m_iWaits++ > 0)
+        return;
+    m_kReports.clear();
+    m_kSincePainted.start();
+    QGuiApplication::setOverrideCursor(Qt::WaitCursor);
+}
+
+void CContent::EndWaitCursor()
+{
+    if (--m_iWaits > 0)
+        return;
+    QGuiApplication::restoreOverrideCursor();
+    ShowNotes();
+}
+
+void CContent::RedrawFrame()
+{
+    window()->repaint();
+}
+
+void CContent::PostCloseRequest()
+{
+    QMetaObject::invokeMethod(window(), &QWidget::close, Qt::QueuedConnection);
+}
+
+void CContent::EnableChild(std::string_view child, bool on)
+{
+    if (auto* widget = Child<QWidget>(child))
+        widget->setEnabled(on);
+}
+
+void CContent::SetChildFace(std::string_view child, int face)
+{
+    if (auto* button = Child<CFaceButton>(child))
+        button->SetFace(face);
+}
+
+void CContent::SetChildButtonState(std::string_view child, bool on)
+{
+    if (auto* button = Child<QAbstractButton>(child))
+        button->setChecked(on);
+}
+
+bool CContent::GetChildButtonState(std::string_view child) const
+{
+    const auto* button = Child<QAbstractButton>(child);
+    return button && button->isChecked();
+}
+
+void CContent::SetChildScrollRange(std::string_view child, int low, int high)
+{
+    if (auto* bar = Child<QSlider>(child))
+        bar->setRange(low, high);
+}
+
+void CContent::SetChildScrollValue(std::string_view child, int value)
+{
+    if (auto* bar = Child<QSlider>(child); bar && !bar->isSliderDown())
+        bar->setValue(value);
+}
+
+void CContent::SetChildText(std::string_view child, const std::string& text)
+{
+    if (auto* title = Child<CTitleLabel>(child))
+        title->ShowAtOnce(ToQString(text));
+    else if (auto* label = Child<QLabel>(child))
+        label->setText(ToQString(text));
+}
+
+std::unique_ptr<CMotionView> CContent::CreateView(std::string_view child)
+{
+    auto* const surface = Child<CPreviewWidget>(child);
+    return surface ? surface->MakeView() : nullptr;
+}
+
+// Ticks that come in the midst of an operation are lost, as if it had kept the program from its events.
+void CContent::SetTimer(int id, int milliseconds)
+{
+    std::unique_ptr<QTimer>& timer = m_kTimers[id];
+    if (!timer)
+    {
+        timer = std::make_unique<QTimer>();
+        timer->setTimerType(Qt::PreciseTimer);
+        connect(timer.get(), &QTimer::timeout, this, [this, id] {
+            if (m_pkLogic && m_iWaits == 0)
+                m_pkLogic->OnTimer(id);
+        });
+    }
+    timer->start(milliseconds);
+}
+
+void CContent::KillTimer(int id)
+{
+    if (const auto found = m_kTimers.find(id); found != m_kTimers.end())
+        found->second->stop();
+}
+
+void CContent::ShowProfileEditor(bool visible)
+{
+    if (m_pkEditor)
+        m_pkEditor->SetShown(visible);
+}
+
+void CContent::RefreshProfileEditor()
+{
+    if (m_pkEditor)
+        m_pkEditor->Refresh();
+}
+
+bool CContent::RunBoneOffset(CBoneOffsetDialog& dialog)
+{
+    return m_pkEditor && m_pkEditor->RunBoneOffset(dialog);
+}
+
+} // namespace gw

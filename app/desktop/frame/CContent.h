@@ -1,0 +1,97 @@
+#pragma once
+
+#include "CContentWindow.h"
+#include "CProfileCombo.h"
+#include "CReport.h"
+
+#include <QElapsedTimer>
+#include <QTimer>
+#include <QWidget>
+#include <functional>
+#include <map>
+#include <memory>
+#include <vector>
+
+namespace gw {
+
+class CGaitConvertContent;
+class CLeftKeys;
+class CProfileEditorWindow;
+class CSkin;
+
+/// The face of the main window: a skin's children. Clicks, drags and ticks go to the conversion behind it,
+/// which answers through the port that this is.
+class CContent : public QWidget, public CContentWindow
+{
+public:
+    /// Keys must outlive the face; the skin need not.
+    CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame);
+    ~CContent() override;
+
+    /// The conversion that commands go to; null as long as there is none.
+    void SetLogic(CGaitConvertContent* logic) { m_pkLogic = logic; }
+    void SetEditor(CProfileEditorWindow* editor) { m_pkEditor = editor; }
+    /// In the midst of an operation or of a question: nothing new can begin.
+    bool IsBusy() const;
+    /// Brings all of both motions into their views.
+    void FrameAll();
+
+    /// The mouse went down on the title.
+    std::function<void(const QPoint& globalPosition)> m_kTitleDown;
+    /// The mouse went down in the icon's corner.
+    std::function<void(const QPoint& globalPosition)> m_kCornerDown;
+
+    EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
+    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
+    std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
+    bool IsKeyDown(EKey key) const override;
+    void Report(const CReport& report) override;
+    bool IsProgressDue() override;
+    void StayPainted() override;
+    void BeginWaitCursor() override;
+    void EndWaitCursor() override;
+    void RedrawFrame() override;
+    void PostCloseRequest() override;
+    void EnableChild(std::string_view child, bool on) override;
+    void SetChildFace(std::string_view child, int face) override;
+    void SetChildButtonState(std::string_view child, bool on) override;
+    bool GetChildButtonState(std::string_view child) const override;
+    void SetChildScrollRange(std::string_view child, int low, int high) override;
+    void SetChildScrollValue(std::string_view child, int value) override;
+    void SetChildText(std::string_view child, const std::string& text) override;
+    std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
+    CCntComboExControl& ProfileCombo() override { return m_kCombo; }
+    void SetTimer(int id, int milliseconds) override;
+    void KillTimer(int id) override;
+    void ShowProfileEditor(bool visible) override;
+    void RefreshProfileEditor() override;
+    bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
+    void ShowInFileManager(const std::string& path) override;
+    void OpenHelpFile(const std::string& path) override;
+    bool OpenWebPage(const std::string& address) override;
+
+protected:
+    void mousePressEvent(QMouseEvent* event) override;
+
+private:
+    template <class Widget>
+    Widget* Child(std::string_view name) const;
+    void Connect(QWidget* child);
+    void ConnectBar(QWidget* child);
+    void Click(const std::string& child);
+    void ShowNotes();
+    std::string TakeNotes();
+
+    const CLeftKeys& m_kKeys;
+    CGaitConvertContent* m_pkLogic = nullptr;
+    CProfileEditorWindow* m_pkEditor = nullptr;
+    std::map<std::string, QWidget*, std::less<>> m_kChildren;
+    std::map<int, std::unique_ptr<QTimer>> m_kTimers;
+    CProfileCombo m_kCombo;
+    std::vector<CReport> m_kReports; ///< of the present or last operation, until they were shown
+    QElapsedTimer m_kSincePainted;   ///< within an operation
+    int m_iWaits = 0;
+};
+
+} // namespace gw

@@ -1,0 +1,205 @@
+#include "CGaitConvertFrame.h"
+
+#include "CContent.h"
+#include "CGaitConvertContent.h"
+#include "CPlatform.h"
+#include "CProfileEditorWindow.h"
+#include "CSkin.h"
+#include "CornerMenu.h"
+#include "QtText.h"
+#include "StringTable.h"
+#include "WindowPlacement.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QCloseEvent>
+#include <QDragEnterEvent>
+#include <QMimeData>
+#include <QMouseEvent>
+#include <QKeyCombination>
+#include <QKeySequence>
+#include <QScreen>
+#include <QShortcut>
+#include <QTimer>
+#include <QUrl>
+#include <QWindow>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kPlaceSetting = "WindowPos";
+constexpr int kMenuMilliseconds = 5;
+constexpr int kRetryMilliseconds = 200;
+constexpr int kHeadOnScreen = 40; // pixels of the title that must be where a mouse can reach them
+
+// Keys that click a child. The left Ctrl key would turn a click on "open" into a batch run.
+struct Key
+{
+    QKeyCombination keys;
+    const char* child;
+};
+constexpr Key kKeys[] = {
+    {Qt::CTRL | Qt::Key_Return, "convert"},
+    {Qt::CTRL | Qt::Key_Enter,  "convert"},
+    {Qt::CTRL | Qt::Key_S,      "apply"  },
+    {Qt::Key_Space,             "play"   },
+    {Qt::Key_Home,              "back"   },
+    {Qt::Key_End,               "end"    },
+    {Qt::Key_Left,              "fback"  },
+    {Qt::Key_Right,             "fend"   },
+    {Qt::Key_F1,                "help"   },
+};
+
+bool IsReachable(const QPoint& place)
+{
+    return QGuiApplication::screenAt(place + QPoint(kHeadOnScreen, kHeadOnScreen / 2)) != nullptr;
+}
+
+std::string DroppedPath(const QMimeData& dropped)
+{
+    for (const QUrl& address : dropped.urls())
+    {
+        if (address.isLocalFile())
+            return ToUtf8(address.toLocalFile());
+    }
+    return {};
+}
+
+} // namespace
+
+CGaitConvertFrame::CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, CPlatform& platform)
+    : QWidget(nullptr, Qt::Window | Qt::FramelessWindowHint), m_kPlatform(platform),
+      m_pkFace(new CContent(skin, keys, this)),
+      m_spContent(std::make_unique<CGaitConvertContent>(*m_pkFace, platform)),
+      m_kFilter([this] { m_pkFace->PostCloseRequest(); })
+{
+    m_pkFace->SetLogic(m_spContent.get());
+    m_pkFace->m_kTitleDown = [this](const QPoint& position) { BeginMove(position); };
+    m_pkFace->m_kCornerDown = [this](const QPoint& position) { OpenCornerMenu(position); };
+    m_spContent->OnInitContent();
+    m_spContent->SetTitle({});
+    m_pkEditor = new CProfileEditorWindow(*m_spContent, platform, this);
+    m_pkFace->SetEditor(m_pkEditor);
+    setWindowTitle(ToQString(m_spContent->Message(kTitleMessage)));
+    setWindowIcon(skin.Icon("logo"));
+    setAcceptDrops(true);
+    Place(skin.Size());
+    AddShortcuts();
+}
+
+// The face and the editor look at the conversion until their end.
+CGaitConvertFrame::~CGaitConvertFrame()
+{
+    delete m_pkEditor;
+    m_pkFace->SetEditor(nullptr);
+    m_pkFace->SetLogic(nullptr);
+    m_spContent.reset();
+}
+
+// A stored place counts where the window can be seen there; the size is always the skin's.
+void CGaitConvertFrame::Place(const QSize& size)
+{
+    setFixedSize(size);
+    WindowPlacement stored;
+    if (ScanPlacement(m_kPlatform.ReadSetting(kPlaceSetting), stored) &&
+        IsReachable({stored.left, stored.top}))
+        move(stored.left, stored.top);
+    else if (const QScreen* screen = QGuiApplication::primaryScreen())
+        move(screen->availableGeometry().center() - rect().center());
+}
+
+void CGaitConvertFrame::StorePlace()
+{
+    if (isMinimized() || isMaximized())
+        return;
+    WindowPlacement placement;
+    placement.minimisedX = placement.minimisedY = placement.maximisedX = placement.maximisedY = -1;
+    placement.left = x();
+    placement.top = y();
+    placement.right = x() + width();
+    placement.bottom = y() + height();
+    m_kPlatform.WriteSetting(kPlaceSetting, PlacementText(placement));
+}
+
+void CGaitConvertFrame::AddShortcuts()
+{
+    const auto add = [this](QKeyCombination keys, auto run) {
+        connect(new QShortcut(QKeySequence(keys), this), &QShortcut::activated, this, run);
+    };
+    for (const Key& key : kKeys)
+    {
+        auto* const button = findChild<QAbstractButton*>(QLatin1String(key.child));
+        add(key.keys, [button] { button->click(); });
+    }
+    add(Qt::CTRL | Qt::Key_O, [this] { m_spContent->OpenSource(); });
+    add(QKeyCombination(Qt::Key_F), [this] { m_pkFace->FrameAll(); });
+}
+
+void CGaitConvertFrame::OpenSoon(const std::string& path)
+{
+    const bool busy = m_pkFace->IsBusy();
+    QTimer::singleShot(busy ? kRetryMilliseconds : 0, this, [this, path] {
+        if (m_pkFace->IsBusy())
+            OpenSoon(path);
+        else
+            m_spContent->OpenDropped(path);
+    });
+}
+
+void CGaitConvertFrame::closeEvent(QCloseEvent* event)
+{
+    if (m_pkFace->IsBusy() || !m_spContent->MayClose())
+    {
+        event->ignore();
+        return;
+    }
+    StorePlace();
+    m_pkEditor->close();
+    event->accept();
+    QCoreApplication::quit();
+}
+
+void CGaitConvertFrame::BeginMove(const QPoint& globalPosition)
+{
+    if (windowHandle() && windowHandle()->startSystemMove())
+        return;
+    m_kGrip = globalPosition - pos();
+    grabMouse();
+}
+
+void CGaitConvertFrame::mouseMoveEvent(QMouseEvent* event)
+{
+    if (m_kGrip)
+        move(event->globalPosition().toPoint() - *m_kGrip);
+}
+
+void CGaitConvertFrame::mouseReleaseEvent(QMouseEvent*)
+{
+    if (m_kGrip)
+        releaseMouse();
+    m_kGrip.reset();
+}
+
+void CGaitConvertFrame::OpenCornerMenu(const QPoint& globalPosition)
+{
+    m_kFilter.RememberCorner(globalPosition);
+    QTimer::singleShot(kMenuMilliseconds, this, [this, globalPosition] {
+        QMenu* const menu = MakeCornerMenu(*this);
+        menu->popup(globalPosition);
+    });
+}
+
+void CGaitConvertFrame::dragEnterEvent(QDragEnterEvent* event)
+{
+    if (!DroppedPath(*event->mimeData()).empty() && !m_pkFace->IsBusy())
+        event->acceptProposedAction();
+}
+
+void CGaitConvertFrame::dropEvent(QDropEvent* event)
+{
+    event->acceptProposedAction();
+    OpenSoon(DroppedPath(*event->mimeData()));
+}
+
+} // namespace gw

@@ -1,0 +1,56 @@
+#pragma once
+
+#include "CMessageFilter.h"
+
+#include <QPoint>
+#include <QWidget>
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace gw {
+
+class CContent;
+class CGaitConvertContent;
+class CLeftKeys;
+class CPlatform;
+class CProfileEditorWindow;
+class CSkin;
+
+/// The main window: a frame without a border around its face, with the conversion behind it. Its size is the
+/// skin's.
+class CGaitConvertFrame : public QWidget
+{
+public:
+    /// Keys and platform must outlive the window.
+    CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, CPlatform& platform);
+    ~CGaitConvertFrame() override;
+
+    CGaitConvertContent& Content() { return *m_spContent; }
+    /// Opens what somebody else names (another start of the program, a drop), as soon as nothing else is
+    /// under way.
+    void OpenSoon(const std::string& path);
+
+protected:
+    void closeEvent(QCloseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+
+private:
+    void Place(const QSize& size);
+    void StorePlace();
+    void AddShortcuts();
+    void BeginMove(const QPoint& globalPosition);
+    void OpenCornerMenu(const QPoint& globalPosition);
+
+    CPlatform& m_kPlatform;
+    CContent* m_pkFace;
+    std::unique_ptr<CGaitConvertContent> m_spContent;
+    CProfileEditorWindow* m_pkEditor;
+    CMessageFilter m_kFilter;
+    std::optional<QPoint> m_kGrip; ///< where the mouse holds the window while it is dragged by hand
+};
+
+} // namespace gw

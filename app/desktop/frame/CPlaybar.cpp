@@ -1,0 +1,60 @@
+#include "CPlaybar.h"
+
+#include <QKeyEvent>
+#include <QMouseEvent>
+#include <QStyle>
+#include <QWheelEvent>
+
+namespace gw {
+
+namespace {
+
+constexpr int kHandleWidth = 14; // the middle of the handle stands at the value
+
+} // namespace
+
+void CPlaybar::GoTo(int x)
+{
+    const int wanted =
+        QStyle::sliderValueFromPosition(minimum(), maximum(), x - kHandleWidth / 2, width() - kHandleWidth);
+    setValue(wanted);
+    if (m_kScroll)
+        m_kScroll(wanted);
+}
+
+void CPlaybar::mousePressEvent(QMouseEvent* event)
+{
+    if (event->button() != Qt::LeftButton)
+        return;
+    setSliderDown(true);
+    if (m_kMouseDown)
+        m_kMouseDown();
+    GoTo(event->position().toPoint().x());
+}
+
+void CPlaybar::mouseMoveEvent(QMouseEvent* event)
+{
+    if (isSliderDown())
+        GoTo(event->position().toPoint().x());
+}
+
+void CPlaybar::mouseReleaseEvent(QMouseEvent* event)
+{
+    if (event->button() != Qt::LeftButton || !isSliderDown())
+        return;
+    setSliderDown(false);
+    if (m_kMouseUp)
+        m_kMouseUp();
+}
+
+void CPlaybar::keyPressEvent(QKeyEvent* event)
+{
+    event->ignore();
+}
+
+void CPlaybar::wheelEvent(QWheelEvent* event)
+{
+    event->ignore();
+}
+
+} // namespace gw

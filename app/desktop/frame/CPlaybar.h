@@ -1,0 +1,30 @@
+#pragma once
+
+#include <QSlider>
+#include <functional>
+
+namespace gw {
+
+/// The bar under the views: goes to where the mouse is pressed, and tells when a drag begins and ends. Keys
+/// are left to the window.
+class CPlaybar : public QSlider
+{
+public:
+    explicit CPlaybar(QWidget* parent) : QSlider(Qt::Horizontal, parent) {}
+
+    std::function<void()> m_kMouseDown;
+    std::function<void(int value)> m_kScroll;
+    std::function<void()> m_kMouseUp;
+
+protected:
+    void mousePressEvent(QMouseEvent* event) override;
+    void mouseMoveEvent(QMouseEvent* event) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void wheelEvent(QWheelEvent* event) override;
+
+private:
+    void GoTo(int x);
+};
+
+} // namespace gw

@@ -1,0 +1,38 @@
+#pragma once
+
+#include "CCntComboExControl.h"
+
+#include <QPointer>
+#include <functional>
+
+class QAbstractButton;
+class QComboBox;
+
+namespace gw {
+
+/// The list of profiles on two children of the face: the field that shows the selected one, and the arrow
+/// that opens the list.
+class CProfileCombo : public CProfileList
+{
+public:
+    /// The notification of a choice by hand.
+    static constexpr int kChosen = 9;
+
+    void AddItem(const std::string& text, int userData) override;
+    void DeleteItem(int index) override;
+    void SetCurSel(int index) override;
+
+    /// Both may die before this.
+    void SetChildren(QComboBox* field, QAbstractButton* arrow);
+    /// What a choice by hand calls, after the selection.
+    void SetNotify(std::function<void(int code)> notify) { m_kNotify = std::move(notify); }
+
+private:
+    void ShowSelection();
+    void Choose(int index);
+
+    QPointer<QComboBox> m_kField;
+    std::function<void(int)> m_kNotify;
+};
+
+} // namespace gw

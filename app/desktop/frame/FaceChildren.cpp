@@ -1,0 +1,136 @@
+#include "FaceChildren.h"
+
+#include "CPlaybar.h"
+#include "CPreviewWidget.h"
+#include "CTitleLabel.h"
+#include "QtText.h"
+
+#include <QComboBox>
+#include <QCoreApplication>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QPainter>
+
+namespace gw {
+
+namespace {
+
+constexpr QSize kIconSize(20, 20);
+constexpr int kMostVisibleProfiles = 20;
+
+class CPicture : public QWidget
+{
+public:
+    CPicture(const QIcon& icon, QWidget* face) : QWidget(face), m_kIcon(icon)
+    {
+        setAttribute(Qt::WA_TransparentForMouseEvents);
+    }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QPainter painter(this);
+        m_kIcon.paint(&painter, rect());
+    }
+
+private:
+    QIcon m_kIcon;
+};
+
+QWidget* MakeLabel(const CSkinChild& child, const CSkin& skin, QWidget* face)
+{
+    auto* const label = new QLabel(skin.Text(child.name), face);
+    label->setTextFormat(Qt::PlainText);
+    label->setAlignment(Qt::AlignVCenter | (child.kind == "value" ? Qt::AlignRight : Qt::AlignLeft));
+    return label;
+}
+
+QWidget* MakeTitle(QWidget* face)
+{
+    auto* const title = new CTitleLabel(face);
+    title->setTextFormat(Qt::PlainText);
+    return title;
+}
+
+QWidget* MakeView(const CLeftKeys& keys, QWidget* face)
+{
+    if (HasOpenGL())
+        return new CPreviewWidget(keys, face);
+    auto* const words =
+        new QLabel(QCoreApplication::translate("Face", "There is no OpenGL on this screen, so motions "
+                                                       "cannot be shown.\nOpening, converting and "
+                                                       "saving work all the same."),
+                   face);
+    words->setAlignment(Qt::AlignCenter);
+    words->setWordWrap(true);
+    return words;
+}
+
+QWidget* MakeCombo(QWidget* face)
+{
+    auto* const combo = new QComboBox(face);
+    combo->setMaxVisibleItems(kMostVisibleProfiles);
+    return combo;
+}
+
+QWidget* MakeLine(QWidget* face)
+{
+    auto* const line = new QWidget(face);
+    line->setAttribute(Qt::WA_StyledBackground);
+    return line;
+}
+
+QWidget* MakeWidget(const CSkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
+{
+    if (child.kind == "picture")
+        return new CPicture(skin.Icon(child.icon), face);
+    if (child.kind == "caption" || child.kind == "value")
+        return MakeLabel(child, skin, face);
+    if (child.kind == "text")
+        return MakeTitle(face);
+    if (child.kind == "view")
+        return MakeView(keys, face);
+    if (child.kind == "bar")
+        return new CPlaybar(face);
+    if (child.kind == "combo")
+        return MakeCombo(face);
+    if (child.kind == "line")
+        return MakeLine(face);
+    return new CFaceButton(child, skin, face);
+}
+
+} // namespace
+
+CFaceButton::CFaceButton(const CSkinChild& child, const CSkin& skin, QWidget* face)
+    : QPushButton(face), m_kFirst(skin.Icon(child.icon)),
+      m_kSecond(child.secondIcon.empty() ? m_kFirst : skin.Icon(child.secondIcon))
+{
+    // A blank keeps the text off the picture.
+    const QString text = skin.Text(child.name);
+    setText(text.isEmpty() || child.icon.empty() ? text : QLatin1Char(' ') + text);
+    setCheckable(child.kind == "toggle");
+    setIconSize(kIconSize);
+    SetFace(0);
+}
+
+void CFaceButton::keyPressEvent(QKeyEvent* event)
+{
+    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
+        click();
+    else
+        QPushButton::keyPressEvent(event);
+}
+
+QWidget* MakeFaceChild(const CSkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
+{
+    QWidget* const widget = MakeWidget(child, skin, keys, face);
+    const QString name = skin.Text(child.name, ".name");
+    widget->setObjectName(ToQString(child.name));
+    widget->setProperty("kind", ToQString(child.kind));
+    widget->setGeometry(child.place);
+    widget->setAccessibleName(name.isEmpty() ? skin.Text(child.name) : name);
+    widget->setToolTip(skin.Text(child.name, ".tip"));
+    return widget;
+}
+
+} // namespace gw
