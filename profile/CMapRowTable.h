@@ -65,6 +65,8 @@ public:
     CRowNumbers Numbers(int row) const;
     /// The row of a target bone without regard to case, or kNone.
     int FindTarget(std::string_view target) const;
+    /// Whether all texts are equal, whatever is selected.
+    bool HasSameRows(const CMapRowTable& other) const { return m_kRows == other.m_kRows; }
 
     /// Appends a row, or changes the one of the same target. A row's source never changes, and the row at
     /// index 0 keeps the rotation that it was added with.

@@ -70,6 +70,20 @@ bool SelectedText(const CBoneTree& tree, std::string& name)
 
 } // namespace
 
+// What happens in its lifetime is one step of undo.
+class CProfileEditorDialog::CUserCommand
+{
+public:
+    explicit CUserCommand(CProfileEditorDialog& editor) : m_kEditor(editor), m_kBefore(editor.State()) {}
+    ~CUserCommand() { m_kEditor.m_kHistory.Keep(std::move(m_kBefore), m_kEditor.State()); }
+    CUserCommand(const CUserCommand&) = delete;
+    CUserCommand& operator=(const CUserCommand&) = delete;
+
+private:
+    CProfileEditorDialog& m_kEditor;
+    CProfileState m_kBefore;
+};
+
 CProfileEditorDialog::CProfileEditorDialog(CProfileOwner& owner) : m_kOwner(owner)
 {
     m_kProfileName = "Untitled";
@@ -169,6 +183,7 @@ bool CProfileEditorDialog::ReadProfile(std::string path, int* matched, int* tota
     {
         m_bDirty = false;
         m_kRows.Clear();
+        m_kHistory.Clear();
     }
     const bool fits = ReadLines(reader, matched, total, mode);
     if (load)
@@ -237,7 +252,10 @@ bool CProfileEditorDialog::WriteProfile(EProfileWrite mode)
     const bool written = ReplaceFile(path, ProfileText(m_kProfileName, m_iFrameRate, m_kRootOffset, m_kRows));
     m_kOwner.ShowMessage(written ? kSaved : kSaveFailed, EButtons::OK);
     if (written)
+    {
+        m_kHistory.ProfileSaved(m_kProfileName, path);
         m_kOwner.ProfileSetChanged();
+    }
     m_bDirty = false;
     m_kProfilePath = std::move(path);
     UpdateButtons();
@@ -394,6 +412,7 @@ void CProfileEditorDialog::UpdateButtons()
 
 void CProfileEditorDialog::ClickButton(int id)
 {
+    const CUserCommand command(*this);
     if (id == kAddToMapButton && m_kButtons.addToMap)
         AddToMap();
     else if (id == kRemoveButton && m_kButtons.remove)
@@ -408,6 +427,7 @@ void CProfileEditorDialog::ClickButton(int id)
 
 void CProfileEditorDialog::LeaveField()
 {
+    const CUserCommand command(*this);
     CommitFields(EFieldCommit::Apply);
     UpdateButtons();
 }
@@ -432,6 +452,7 @@ void CProfileEditorDialog::ClickRow(int row)
 
 void CProfileEditorDialog::DoubleClickRow(int row)
 {
+    const CUserCommand command(*this);
     SelectRowBones(row);
     EditBoneOffset();
     UpdateButtons();

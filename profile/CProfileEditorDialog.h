@@ -4,6 +4,7 @@
 #include "CBoneTree.h"
 #include "CMapRowTable.h"
 #include "CProfileFields.h"
+#include "CProfileHistory.h"
 #include "CProfileOwner.h"
 
 #include <string>
@@ -109,6 +110,10 @@ public:
     void Show() { m_bVisible = true; }
     /// Hides the dialog; its state stays the current profile.
     void Close();
+    /// Each takes back or repeats one command of the user that changed rows, name or numbers. They go on
+    /// through a save, and end at the profile's loading.
+    void Undo();
+    void Redo();
 
     // The operations behind.
     /// Reads a profile file. False when it cannot be opened, which changes nothing, and when a row's target
@@ -148,12 +153,17 @@ public:
     void SelectRowBones(int row);
 
 private:
+    class CUserCommand;
+
     bool ReadLines(CProfileReader& reader, int* matched, int* total, EProfileRead mode);
     void LoadLine(const CProfileLine& line);
     void MarkRowBones(std::string_view source, std::string_view target, bool mapped);
     void CommitNumbers(EFieldCommit mode);
     void CommitName(EFieldCommit mode);
     void SetDirty();
+    CProfileState State() const;
+    void Restore(const CProfileState& state);
+    void MarkAllRows(bool mapped);
 
     CProfileOwner& m_kOwner;
     const std::vector<std::string>* m_pkNamesInUse = nullptr;
@@ -162,6 +172,7 @@ private:
     CBoneTree m_kTargetTree{kMappedTargetImage};
     CProfileFields m_kFields;
     CProfileButtons m_kButtons;
+    CProfileHistory m_kHistory;
     bool m_bDirty = false;
     bool m_bVisible = false;
 };

@@ -1,0 +1,54 @@
+#include "CProfileHistory.h"
+
+#include <utility>
+
+namespace gw {
+
+bool CProfileState::IsSameProfile(const CProfileState& other) const
+{
+    return name == other.name && frameRate == other.frameRate && rootOffset == other.rootOffset &&
+           rows.HasSameRows(other.rows);
+}
+
+void CProfileHistory::Keep(CProfileState before, const CProfileState& after)
+{
+    if (before.IsSameProfile(after))
+        return;
+    m_kUndo.push_back(std::move(before));
+    if (m_kUndo.size() > kStepLimit)
+        m_kUndo.pop_front();
+    m_kRedo.clear();
+}
+
+// A save gives states that differed in their name alone the same one: those are no steps any more.
+bool CProfileHistory::Step(States& from, States& to, CProfileState& present)
+{
+    while (!from.empty() && from.back().IsSameProfile(present))
+        from.pop_back();
+    if (from.empty())
+        return false;
+    to.push_back(std::exchange(present, std::move(from.back())));
+    from.pop_back();
+    return true;
+}
+
+void CProfileHistory::ProfileSaved(const std::string& name, const std::string& path)
+{
+    for (States* states : {&m_kUndo, &m_kRedo})
+    {
+        for (CProfileState& state : *states)
+        {
+            state.name = name;
+            state.path = path;
+            state.dirty = true;
+        }
+    }
+}
+
+void CProfileHistory::Clear()
+{
+    m_kUndo.clear();
+    m_kRedo.clear();
+}
+
+} // namespace gw
