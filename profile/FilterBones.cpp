@@ -1,0 +1,33 @@
+#include "FilterBones.h"
+
+#include "CBoneTree.h"
+#include "Text.h"
+
+#include <algorithm>
+
+namespace gw {
+
+std::vector<int> FilterBones(const CBoneTree& tree, std::string_view text)
+{
+    const std::string part = LowerCase(text);
+    std::vector<int> bones;
+    for (int item = 0; item < static_cast<int>(tree.Items().size()); ++item)
+    {
+        if (LowerCase(tree.Text(item)).find(part) != std::string::npos)
+            bones.push_back(item);
+    }
+    std::ranges::stable_partition(bones, [&](int item) { return !tree.IsMapped(item); });
+    return bones;
+}
+
+std::string BonePath(const CBoneTree& tree, int item)
+{
+    std::string path;
+    const auto& items = tree.Items();
+    const auto parentOf = [&](int child) { return items[static_cast<size_t>(child)].m_iParent; };
+    for (int bone = parentOf(item); bone != CBoneTree::kNone; bone = parentOf(bone))
+        path = tree.Text(bone) + (path.empty() ? "" : " / ") + path;
+    return path;
+}
+
+} // namespace gw
