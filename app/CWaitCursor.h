@@ -1,20 +1,19 @@
 #pragma once
 
-#include "CContentWindow.h"
-
 namespace gw {
 
-/// Shows the wait cursor for as long as it lives.
+/// Shows a window's wait cursor for as long as it lives.
+template <class TWindow>
 class CWaitCursor
 {
 public:
-    explicit CWaitCursor(CContentWindow& window) : m_kWindow(window) { m_kWindow.BeginWaitCursor(); }
+    explicit CWaitCursor(TWindow& window) : m_kWindow(window) { m_kWindow.BeginWaitCursor(); }
     ~CWaitCursor() { m_kWindow.EndWaitCursor(); }
     CWaitCursor(const CWaitCursor&) = delete;
     CWaitCursor& operator=(const CWaitCursor&) = delete;
 
 private:
-    CContentWindow& m_kWindow;
+    TWindow& m_kWindow;
 };
 
 } // namespace gw

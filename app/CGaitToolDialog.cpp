@@ -1,0 +1,285 @@
+#include "CGaitToolDialog.h"
+
+#include "CPlatform.h"
+#include "CProfileEditorDialog.h"
+#include "CRetargeter.h"
+#include "CWaitCursor.h"
+#include "FindBone.h"
+#include "SourceTiming.h"
+#include "ToolStatus.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kBaseFile = "base.htr";
+constexpr float kSavedScale = 0.016667f; // one frame of sixty, as the tool has always saved
+
+const CFileDialogSetup kOpenMotion{"htr", "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||", {}};
+const CFileDialogSetup kSaveMotion{"htr", "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||", {}};
+
+constexpr void (CMotionView::*kTransport[])() = {
+    &CMotionView::SeekStart, &CMotionView::StepBack,    &CMotionView::Stop,
+    &CMotionView::Play,      &CMotionView::StepForward,
+};
+
+// A tree of another skeleton; the selection stays where a bone of its name is there.
+void Rebuild(CBoneTree& tree, CNode* root)
+{
+    const std::string selected = tree.SelectedText();
+    tree.Rebuild(root);
+    tree.Select(tree.Find(selected));
+}
+
+Ref<CNode> CopyOf(CNode* root)
+{
+    CCloneMap map;
+    return root ? static_cast<CNode*>(root->Clone(map)) : nullptr;
+}
+
+} // namespace
+
+struct CGaitToolDialog::Command
+{
+    int m_iControl;
+    void (CGaitToolDialog::*m_pkRun)();
+    bool (CGaitToolDialog::*m_pkEnabled)() const;
+};
+
+const CGaitToolDialog::Command* CGaitToolDialog::FindCommand(int id)
+{
+    using Tool = CGaitToolDialog;
+    static constexpr Command kCommands[] = {
+        {kToolClose,      &Tool::Close,          &Tool::Always         },
+        {kToolLoadSource, &Tool::AskSource,      &Tool::Always         },
+        {kToolLoadTarget, &Tool::AskTarget,      &Tool::Always         },
+        {kToolAddToMap,   &Tool::AddToMap,       &Tool::HasBothTrees   },
+        {kToolLoadMap,    &Tool::AskMap,         &Tool::HasBothTrees   },
+        {kToolDelete,     &Tool::RemoveLine,     &Tool::HasLines       },
+        {kToolDeleteAll,  &Tool::RemoveAllLines, &Tool::HasLines       },
+        {kToolSaveMap,    &Tool::AskMapPath,     &Tool::HasLines       },
+        {kToolConvert,    &Tool::Convert,        &Tool::HasLines       },
+        {kToolDetail,     &Tool::EditDetail,     &Tool::HasSelectedLine},
+        {kToolSaveResult, &Tool::AskResultPath,  &Tool::HasTarget      },
+    };
+    const auto* const found = std::ranges::find(kCommands, id, &Command::m_iControl);
+    return found == std::end(kCommands) ? nullptr : found;
+}
+
+CGaitToolDialog::CGaitToolDialog(CToolWindow& window, const CPlatform& platform)
+    : m_kWindow(window), m_kPlatform(platform), m_kSourceTree(CProfileEditorDialog::kMappedSourceImage),
+      m_kTargetTree(CProfileEditorDialog::kMappedTargetImage)
+{
+}
+
+CGaitToolDialog::~CGaitToolDialog() = default;
+
+void CGaitToolDialog::OnInitDialog()
+{
+    for (const EToolMotion motion : kToolMotions)
+        m_kViews[Index(motion)] = m_kWindow.CreateView(motion);
+}
+
+// ---- buttons
+
+void CGaitToolDialog::ClickButton(int id)
+{
+    const Command* const command = FindCommand(id);
+    if (command && IsEnabled(id))
+        (this->*command->m_pkRun)();
+    else if (!command)
+        ClickTransport(id);
+}
+
+bool CGaitToolDialog::IsEnabled(int id) const
+{
+    const Command* const command = FindCommand(id);
+    return !command || (this->*command->m_pkEnabled)();
+}
+
+void CGaitToolDialog::ClickTransport(int id)
+{
+    for (const EToolMotion motion : kToolMotions)
+    {
+        const auto& ids = kTransportIds[Index(motion)];
+        const auto* const found = std::ranges::find(ids, id);
+        if (found != std::end(ids) && View(motion))
+            (View(motion)->*kTransport[found - ids])();
+    }
+}
+
+bool CGaitToolDialog::Advance()
+{
+    for (const auto& view : m_kViews)
+    {
+        if (view)
+            view->Advance();
+    }
+    return IsPlaying();
+}
+
+bool CGaitToolDialog::IsPlaying() const
+{
+    return std::ranges::any_of(m_kViews, [](const auto& view) { return view && view->IsPlaying(); });
+}
+
+int CGaitToolDialog::FrameOf(EToolMotion motion) const
+{
+    const CMotionView* const view = View(motion);
+    const float step = view ? view->GetFrameStep() : 0.0f;
+    return step > 0.0f ? static_cast<int>(std::lround(view->GetTime() / step)) : 0;
+}
+
+int CGaitToolDialog::LastFrameOf(EToolMotion motion) const
+{
+    return View(motion) ? static_cast<int>(View(motion)->GetLastFrame()) : 0;
+}
+
+// ---- motions
+
+void CGaitToolDialog::AskSource()
+{
+    if (const auto path = m_kWindow.AskOpenFile(kOpenMotion))
+        LoadSource(*path);
+}
+
+void CGaitToolDialog::AskTarget()
+{
+    if (const auto path = m_kWindow.AskOpenFile(kOpenMotion))
+        LoadTarget(*path);
+}
+
+bool CGaitToolDialog::DropFile(EToolMotion motion, const std::string& path)
+{
+    switch (motion)
+    {
+    case EToolMotion::Source:
+        return LoadSource(path);
+    case EToolMotion::Target:
+        return LoadTarget(path);
+    case EToolMotion::Result:
+        break;
+    }
+    return false;
+}
+
+bool CGaitToolDialog::LoadSource(const std::string& path)
+{
+    const CWaitCursor wait(m_kWindow);
+    if (!Load(EToolMotion::Source, path))
+        return false;
+    // A target is there from now on. Where it cannot be read, that is what the user must know first.
+    const std::string loaded = m_kStatus;
+    if (LoadTargetMotions(m_kPlatform.DataFolder() + kBaseFile))
+        m_kStatus = loaded;
+    TakeSkeletons();
+    return true;
+}
+
+bool CGaitToolDialog::LoadTarget(const std::string& path)
+{
+    const CWaitCursor wait(m_kWindow);
+    if (!LoadTargetMotions(path))
+        return false;
+    TakeSkeletons();
+    return true;
+}
+
+bool CGaitToolDialog::LoadTargetMotions(const std::string& path)
+{
+    return Load(EToolMotion::Result, path) && Load(EToolMotion::Target, path);
+}
+
+// Reads into a file of its own: one that had trees would keep the rest pose of the motion before where the
+// new file has none.
+bool CGaitToolDialog::Load(EToolMotion motion, const std::string& path)
+{
+    CMotionFile file;
+    if (!file.Load(path))
+    {
+        m_kStatus = FailedWords(path, file.Record().Failure());
+        return false;
+    }
+    CMotionFile& taken = m_kMotions[Index(motion)];
+    taken.restRoot = file.restRoot;
+    taken.motionRoot = file.motionRoot;
+    taken.fileVersion = file.fileVersion;
+    m_bConverted = false;
+    m_kStatus = LoadedWords(path, file, file.Record());
+    ShowMotion(motion);
+    return true;
+}
+
+void CGaitToolDialog::ShowMotion(EToolMotion motion)
+{
+    const SourceTiming timing = TimingOf(Motion(motion));
+    if (View(motion))
+        View(motion)->SetScene(Root(motion), timing.FrameStep(), timing.lastFrame);
+}
+
+// The trees of other skeletons, and the lines that still say something about them.
+void CGaitToolDialog::TakeSkeletons()
+{
+    Rebuild(m_kSourceTree, Root(EToolMotion::Source));
+    Rebuild(m_kTargetTree, Root(EToolMotion::Target));
+    m_kStatus += PrunedWords(m_kMap.Prune([this](const CMapLine& line) { return IsMappable(line); }));
+    MarkBones();
+}
+
+void CGaitToolDialog::Convert()
+{
+    const CWaitCursor wait(m_kWindow);
+    for (const EToolMotion motion : kToolMotions)
+    {
+        if (View(motion))
+            View(motion)->Stop();
+    }
+    // A conversion leaves its own rest pose behind, on which the next one must not build.
+    m_kMotions[Index(EToolMotion::Result)].motionRoot = CopyOf(Root(EToolMotion::Target));
+    CRetargeter retargeter;
+    retargeter.SetScenes(Root(EToolMotion::Source), Root(EToolMotion::Result));
+    const CBoneNames sources(Root(EToolMotion::Source));
+    const CBoneNames targets(Root(EToolMotion::Result));
+    for (const CMapLine& line : m_kMap.Lines())
+        ApplyLine(retargeter, line, sources, targets);
+    const SourceTiming timing = TimingOf(Motion(EToolMotion::Source));
+    retargeter.Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, m_kMap.RootPosition(), false, false);
+    ShowMotion(EToolMotion::Result);
+    m_bConverted = true;
+    m_kStatus = ConvertedWords(Motion(EToolMotion::Result), retargeter.Record());
+}
+
+// A bone that is not there is null, as a key or as a source, which the retargeter takes for none.
+void CGaitToolDialog::ApplyLine(CRetargeter& retargeter, const CMapLine& line, const CBoneNames& sources,
+                                const CBoneNames& targets)
+{
+    m_kMap.TakeValue(line);
+    if (line.kind == EMapLine::Fixed)
+        retargeter.SetFixed(targets.Find(line.target), true);
+    if (line.kind != EMapLine::Mapping)
+        return;
+    CNode* const target = targets.Find(line.target);
+    retargeter.SetSourceOf(target, sources.Find(line.source));
+    if (line.hasRotation)
+        retargeter.SetOffsetAngles(target, line.numbers);
+}
+
+void CGaitToolDialog::AskResultPath()
+{
+    if (const auto path = m_kWindow.AskSaveFile(kSaveMotion))
+        SaveResult(*path);
+}
+
+bool CGaitToolDialog::SaveResult(const std::string& path)
+{
+    const CWaitCursor wait(m_kWindow);
+    CMotionFile& result = m_kMotions[Index(EToolMotion::Result)];
+    const bool saved = result.Save(path, kSavedScale);
+    m_kStatus = saved ? SavedWords(path) : NotSavedWords(path, result.Record().Failure());
+    return saved;
+}
+
+} // namespace gw

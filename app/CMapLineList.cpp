@@ -1,0 +1,153 @@
+#include "CMapLineList.h"
+
+#include "ProfileNames.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <iterator>
+#include <utility>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kPosition = "position";
+constexpr std::string_view kFrameRate = "framerate";
+constexpr std::string_view kHeadText = "Unknown Source";
+constexpr size_t kTextLimit = 32;
+
+bool SpeaksOfPosition(const CMapLine& line)
+{
+    return LowerCase(line.text).find(kPosition) != std::string::npos;
+}
+
+// A keyword further inside, as in "Composition", makes a line of its kind all the same but sets nothing.
+bool BeginsWith(const CMapLine& line, std::string_view keyword)
+{
+    return EqualNoCase(std::string_view(line.text).substr(0, keyword.size()), keyword);
+}
+
+std::string RewrittenText(const CMapLine& line)
+{
+    switch (line.kind)
+    {
+    case EMapLine::Mapping:
+        return MappingLine(line.source, line.target, line.numbers);
+    case EMapLine::Position:
+        return PositionLine(line.numbers);
+    case EMapLine::FrameRate:
+        return FrameRateLine(line.frameRate);
+    case EMapLine::Fixed:
+    case EMapLine::Text:
+        break;
+    }
+    return std::string(FirstCharacters(line.text, kTextLimit));
+}
+
+} // namespace
+
+const CMapLine* CMapLineList::SelectedLine() const
+{
+    return m_iSelected == kNone ? nullptr : &m_kLines[static_cast<size_t>(m_iSelected)];
+}
+
+void CMapLineList::Select(int index)
+{
+    m_iSelected = index >= 0 && static_cast<size_t>(index) < m_kLines.size() ? index : kNone;
+}
+
+void CMapLineList::Append(const CMapLine& line)
+{
+    TakeValue(line);
+    m_kLines.push_back(line);
+}
+
+void CMapLineList::EnsureHead()
+{
+    if (std::ranges::any_of(m_kLines, SpeaksOfPosition))
+        return;
+    const CMapLine head[] = {ParseMapLine(kHeadText), ParseMapLine(PositionLine(kVec3Zero)),
+                             ParseMapLine(FrameRateLine(kDefaultFrameRate))};
+    std::ranges::for_each(head, [this](const CMapLine& line) { TakeValue(line); });
+    m_kLines.insert(m_kLines.begin(), std::begin(head), std::end(head));
+    if (m_iSelected != kNone)
+        m_iSelected += static_cast<int>(std::size(head));
+}
+
+void CMapLineList::Add(std::string_view source, std::string_view target)
+{
+    EnsureHead();
+    Append(ParseMapLine(MappingLine(source, target)));
+}
+
+size_t CMapLineList::Replace(const std::vector<CMapLine>& lines, const Fits& fits)
+{
+    Clear();
+    size_t leftOut = 0;
+    for (const CMapLine& line : lines)
+    {
+        if (line.kind == EMapLine::Mapping && !fits(line))
+        {
+            ++leftOut;
+            continue;
+        }
+        if (line.kind == EMapLine::Mapping)
+            EnsureHead();
+        Append(line);
+    }
+    return leftOut;
+}
+
+size_t CMapLineList::Prune(const Fits& fits)
+{
+    const std::vector<CMapLine> before = std::exchange(m_kLines, {});
+    const int selected = std::exchange(m_iSelected, kNone);
+    for (size_t index = 0; index < before.size(); ++index)
+    {
+        const CMapLine& line = before[index];
+        if (line.kind != EMapLine::Mapping || !fits(line))
+            continue;
+        if (static_cast<int>(index) == selected)
+            m_iSelected = static_cast<int>(m_kLines.size());
+        m_kLines.push_back(line);
+    }
+    return before.size() - m_kLines.size();
+}
+
+// The line that moves up is selected next, so that a run of lines goes by repeated clicks.
+void CMapLineList::RemoveSelected()
+{
+    if (m_iSelected == kNone)
+        return;
+    m_kLines.erase(m_kLines.begin() + m_iSelected);
+    Select(std::min(m_iSelected, static_cast<int>(m_kLines.size()) - 1));
+}
+
+void CMapLineList::Clear()
+{
+    m_kLines.clear();
+    m_iSelected = kNone;
+}
+
+void CMapLineList::ReplaceSelected(const CMapLine& line)
+{
+    if (m_iSelected == kNone)
+        return;
+    TakeValue(line);
+    m_kLines[static_cast<size_t>(m_iSelected)] = line;
+}
+
+void CMapLineList::TakeValue(const CMapLine& line)
+{
+    if (line.kind == EMapLine::Position && BeginsWith(line, kPosition))
+        m_kRootPosition = line.numbers;
+    if (line.kind == EMapLine::FrameRate && BeginsWith(line, kFrameRate))
+        m_iFrameRate = line.frameRate;
+}
+
+CMapLine RewrittenLine(const CMapLine& line)
+{
+    return ParseMapLine(RewrittenText(line));
+}
+
+} // namespace gw

@@ -1,0 +1,119 @@
+// What the map tool's buttons do to the list of lines.
+
+#include "CGaitToolDialog.h"
+
+#include "ToolStatus.h"
+
+namespace gw {
+
+namespace {
+
+const CFileDialogSetup kOpenMap{{}, "Map Files |*.prf;|Nap Files |*.txt;||", {}};
+const CFileDialogSetup kSaveMap{"txt", "Map Files |*.txt;||", {}};
+
+void UnmarkAll(CBoneTree& tree)
+{
+    for (size_t item = 0; item < tree.Items().size(); ++item)
+        tree.Mark(static_cast<int>(item), false);
+}
+
+} // namespace
+
+bool CGaitToolDialog::IsMappable(const CMapLine& line) const
+{
+    return m_kSourceTree.Find(line.source) != CBoneTree::kNone &&
+           m_kTargetTree.Find(line.target) != CBoneTree::kNone;
+}
+
+// Markers follow from the lines, so that a bone loses its own with the last line that names it.
+void CGaitToolDialog::MarkBones()
+{
+    UnmarkAll(m_kSourceTree);
+    UnmarkAll(m_kTargetTree);
+    for (const CMapLine& line : m_kMap.Lines())
+    {
+        if (line.kind != EMapLine::Mapping)
+            continue;
+        m_kSourceTree.Mark(m_kSourceTree.Find(line.source), true);
+        m_kTargetTree.Mark(m_kTargetTree.Find(line.target), true);
+    }
+}
+
+void CGaitToolDialog::SelectLine(int index)
+{
+    m_kMap.Select(index);
+    const CMapLine* const line = m_kMap.SelectedLine();
+    if (!line || line->kind != EMapLine::Mapping)
+        return;
+    m_kSourceTree.Select(m_kSourceTree.Find(line->source));
+    m_kTargetTree.Select(m_kTargetTree.Find(line->target));
+}
+
+void CGaitToolDialog::AddToMap()
+{
+    const std::string& source = m_kSourceTree.SelectedText();
+    const std::string& target = m_kTargetTree.SelectedText();
+    m_kStatus.clear();
+    if (source.empty() || target.empty())
+        m_kStatus = "select a bone in both trees first";
+    else
+        m_kMap.Add(source, target);
+    MarkBones();
+}
+
+void CGaitToolDialog::RemoveLine()
+{
+    m_kMap.RemoveSelected();
+    SelectLine(m_kMap.Selected());
+    MarkBones();
+}
+
+void CGaitToolDialog::RemoveAllLines()
+{
+    m_kMap.Clear();
+    MarkBones();
+}
+
+void CGaitToolDialog::EditDetail()
+{
+    CMapLine line = *m_kMap.SelectedLine();
+    if (!m_kWindow.EditLine(line))
+        return;
+    m_kMap.ReplaceSelected(RewrittenLine(line));
+    MarkBones();
+}
+
+void CGaitToolDialog::AskMap()
+{
+    if (const auto path = m_kWindow.AskOpenFile(kOpenMap))
+        LoadMap(*path);
+}
+
+bool CGaitToolDialog::LoadMap(const std::string& path)
+{
+    std::vector<CMapLine> lines;
+    if (!ReadMapLines(path, lines))
+    {
+        m_kStatus = NoMapWords(path);
+        return false;
+    }
+    const size_t leftOut = m_kMap.Replace(lines, [this](const CMapLine& line) { return IsMappable(line); });
+    MarkBones();
+    m_kStatus = MapWords(path, m_kMap.Lines().size(), leftOut);
+    return true;
+}
+
+void CGaitToolDialog::AskMapPath()
+{
+    if (const auto path = m_kWindow.AskSaveFile(kSaveMap))
+        SaveMap(*path);
+}
+
+bool CGaitToolDialog::SaveMap(const std::string& path)
+{
+    const bool written = WriteMapLines(path, m_kMap.Lines());
+    m_kStatus = written ? SavedWords(path) : NotSavedWords(path, {EFailure::WriteError, 0, {}});
+    return written;
+}
+
+} // namespace gw
