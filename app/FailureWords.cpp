@@ -61,7 +61,7 @@ constexpr Words<EFailure> kFailures[] = {
     Row(Cycle, "cycle", "objects in the file hold each other in a ring"),
     Row(TooDeep, "too-deep", "bones or objects are nested deeper than is supported"),
     Row(TooLarge, "too-large", "this is larger than the limit of the format or of the program"),
-    Row(NoTrack, "no-track", "the scene holds no keyframes, so there is no motion to convert"),
+    Row(NoTrack, "no-track", "the scene holds no keyframes, so there is no motion in it"),
     Row(ShortRow, "short-row", "a row has too few values for its joints", "export the file again"),
     Row(StuckNumber, "stuck-number", "a number has something stuck to it; its beginning was read", kMendLine),
     Row(DoubledOffsets, "doubled-offsets", "joint positions repeat the offsets, so bones come out doubled",

@@ -18,6 +18,14 @@ namespace gw {
 
 namespace {
 
+// False for a text with anything but a number that the integer holds.
+template <class T>
+bool ScanInteger(std::string_view text, T& number)
+{
+    const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), number);
+    return error == std::errc() && end == text.data() + text.size();
+}
+
 // Tells the parser of an option, by what its value is.
 class OptionBinder
 {
@@ -38,9 +46,18 @@ public:
     CLI::Option* operator()(int64_t COptions::*target) const
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
-            const auto [end, error] = std::from_chars(text.data(), text.data() + text.size(), *number);
-            if (error != std::errc() || end != text.data() + text.size())
+            if (!ScanInteger(text, *number))
                 throw CLI::ValidationError(Quoted(text) + " is no integer");
+        });
+    }
+    CLI::Option* operator()(CPixelSize COptions::*target) const
+    {
+        return Add([size = &(m_kOptions.*target)](const std::string& text) {
+            const std::string_view words = text;
+            const size_t cross = std::min(text.find('x'), text.size());
+            if (!ScanInteger(words.substr(0, cross), size->width) ||
+                !ScanInteger(words.substr(std::min(cross + 1, text.size())), size->height))
+                throw CLI::ValidationError(Quoted(text) + " is no size like 640x480");
         });
     }
     CLI::Option* operator()(float COptions::*target) const

@@ -14,6 +14,13 @@ enum class EExit : int
     Usage = 2,  ///< the command line was wrong, and nothing was done
 };
 
+/// Of a picture, as the command line says it; not yet looked at by whoever draws.
+struct CPixelSize
+{
+    int width = 640;
+    int height = 480;
+};
+
 /// What a command line asks for. One record serves all commands; each reads what its row in the table of
 /// commands lets through.
 struct COptions
@@ -26,6 +33,9 @@ struct COptions
     std::string dataFolder;   ///< replaces the folder beside the executable; empty for that
     std::string job;          ///< htr or orn
     int64_t frame = 0;
+    std::string with;  ///< the motion to draw beside the first one; empty for none
+    int64_t strip = 1; ///< number of poses
+    CPixelSize size;
     float rate = 0.0f;       ///< frames per second
     float frameScale = 1.0f; ///< factor for the number of frames
 

@@ -16,6 +16,8 @@ constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_
 constexpr uint32_t kConvertOptions =
     kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting | kDryRun | kKeepGoing;
 
+constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
+
 constexpr CCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
         "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
@@ -48,6 +50,10 @@ constexpr CCommand kCommands[] = {
     Row("compare", "SOURCE RESULT", kProfile, kProfile, RunCompare,
         "Measure a conversion: how far the result's bones, feet and path differ.",
         "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),
+    Row("render", "FILE", kRenderOptions, kOutput, RunRender,
+        "Draw a motion into a PNG picture, with its result beside it or under it; needs no display.\n"
+        "A strip begins at the frame and goes to the end of the motion. A frame behind the end is the end.",
+        "gaitwright render walk.bvh -o walk.png --with walk.Kinetra --strip 8 --size 1600x600"),
 };
 
 size_t CountWords(std::string_view text)

@@ -26,6 +26,9 @@ enum EOption : uint32_t
     kDataFolder = 1u << 12,
     kJson = 1u << 13,
     kQuiet = 1u << 14,
+    kWith = 1u << 15,
+    kStrip = 1u << 16,
+    kSize = 1u << 17,
 };
 
 /// One command of the program.
@@ -58,5 +61,6 @@ EExit RunExtract(const COptions& options);
 EExit RunPackage(const COptions& options);
 EExit RunProfiles(const COptions& options);
 EExit RunCompare(const COptions& options);
+EExit RunRender(const COptions& options);
 
 } // namespace gw

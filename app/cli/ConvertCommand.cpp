@@ -1,6 +1,7 @@
 #include "CJsonWriter.h"
 #include "Commands.h"
 #include "ConvertFile.h"
+#include "Output.h"
 #include "Paths.h"
 #include "Text.h"
 #include "Words.h"
@@ -90,8 +91,8 @@ bool PlanMany(const COptions& options, Jobs& jobs)
 
 bool Plan(const COptions& options, Jobs& jobs)
 {
-    if (options.force && options.skipExisting)
-        return Refuse("--force and --skip-existing exclude each other");
+    if (!IsDecidedOnExisting(options))
+        return false;
     const bool isOne =
         options.files.size() == 1 && options.outputFolder.empty() && !FolderExists(options.files[0]);
     return isOne ? PlanOne(options, jobs) : PlanMany(options, jobs);

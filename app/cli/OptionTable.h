@@ -7,9 +7,10 @@
 
 namespace gw {
 
-/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, an integer.
-using COptionTarget =
-    std::variant<bool COptions::*, std::string COptions::*, float COptions::*, int64_t COptions::*>;
+/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, an integer,
+/// a size.
+using COptionTarget = std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
+                                   int64_t COptions::*, CPixelSize COptions::*>;
 
 /// One option of the program.
 struct COptionRow

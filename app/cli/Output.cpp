@@ -9,6 +9,14 @@
 
 namespace gw {
 
+bool IsDecidedOnExisting(const COptions& options)
+{
+    if (!options.force || !options.skipExisting)
+        return true;
+    SayError("--force and --skip-existing exclude each other");
+    return false;
+}
+
 bool IsTaken(const std::string& path)
 {
     return FileExists(path) || FolderExists(path);

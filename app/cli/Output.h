@@ -8,6 +8,9 @@
 
 namespace gw {
 
+/// Whether a command line does not ask for both --force and --skip-existing. Says that they exclude each
+/// other.
+bool IsDecidedOnExisting(const COptions& options);
 /// Whether something stands under a path already.
 bool IsTaken(const std::string& path);
 /// Why a command may not write a file: it is there without --force, or it is a folder.

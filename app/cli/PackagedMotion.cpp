@@ -43,8 +43,11 @@ bool LoadWhole(COrrinStream& scene, const std::string& path)
 bool LoadPackagedMotion(const std::string& path, CMotionFile& motion)
 {
     COrrinStream scene;
-    if (!LoadWhole(scene, path))
-        return false;
+    return LoadWhole(scene, path) && LoadPackagedMotion(path, scene, motion);
+}
+
+bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMotionFile& motion)
+{
     const CPackageBlocks blocks = FindPackage(scene);
     CPackageFacts facts;
     const bool known = blocks.file && ReadPackageFacts(*blocks.info, facts);

@@ -54,7 +54,7 @@ int LastFrame(const PictureMotion& motion)
 std::vector<Moment> MomentsOf(const PictureOptions& options)
 {
     const int last = LastFrame(options.motions.front());
-    const int first = std::clamp(options.frame, 0, last);
+    const int first = FirstFrame(options);
     const int gaps = std::max(options.poseCount - 1, 1);
     std::vector<Moment> moments;
     moments.reserve(static_cast<size_t>(options.poseCount));
@@ -69,16 +69,6 @@ Grid GridOf(const PictureOptions& options)
     if (options.poseCount > 1)
         return {options.width, options.height, options.poseCount, motions};
     return {options.width, options.height, motions, 1};
-}
-
-bool IsDrawable(const PictureOptions& options)
-{
-    // Each part of a side needs a pixel.
-    const auto holds = [](int side, int parts) { return side <= kLongestSide && parts <= side; };
-    if (options.motions.empty() || options.motions.size() > kLongestSide || options.poseCount < 1)
-        return false;
-    const Grid grid = GridOf(options);
-    return holds(grid.width, grid.columns) && holds(grid.height, grid.rows);
 }
 
 void Paste(const RgbPicture& part, const Cell& cell, RgbPicture& picture)
@@ -162,6 +152,21 @@ private:
 };
 
 } // namespace
+
+int FirstFrame(const PictureOptions& options)
+{
+    return std::clamp(options.frame, 0, LastFrame(options.motions.front()));
+}
+
+bool IsDrawable(const PictureOptions& options)
+{
+    // Each part of a side needs a pixel.
+    const auto holds = [](int side, int parts) { return side <= kLongestSide && parts <= side; };
+    if (options.motions.empty() || options.motions.size() > kLongestSide || options.poseCount < 1)
+        return false;
+    const Grid grid = GridOf(options);
+    return holds(grid.width, grid.columns) && holds(grid.height, grid.rows);
+}
 
 EPictureAnswer RenderPicture(const PictureOptions& options, RgbPicture& picture)
 {

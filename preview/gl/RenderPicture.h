@@ -39,6 +39,14 @@ enum class EPictureAnswer : uint8_t
 
 inline constexpr int kLongestSide = 8192; ///< 200 MB of pixels; software renderers take no more
 
+/// Whether the number of motions and poses and the size are such that RenderPicture draws; it looks at
+/// nothing else.
+bool IsDrawable(const PictureOptions& options);
+
+/// The frame that a picture begins with: the one asked for, or the nearest one that there is. There must be a
+/// motion.
+int FirstFrame(const PictureOptions& options);
+
 /// Draws without any display. Each pose is in the middle of its view and as large as all of it can be seen,
 /// the poses of a motion at one scale. The motions stand evaluated at the last pose
 /// afterwards. Without Done the picture is left as it was.

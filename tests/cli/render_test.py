@@ -1,0 +1,112 @@
+"""Pictures of motions, drawn without a display: what is in them, and what is no picture."""
+import json
+
+from harness import DONE, FAILED, USAGE, WALK, CliTest, main
+from made import BVH, Container, moved
+from picture import Picture
+
+LEFT, RIGHT = (0, 0, 0.5, 1), (0.5, 0, 1, 1)
+SIZE = ("--size", "160x120")
+
+
+class Pictures(CliTest):
+    def render(self, *arguments):
+        """Draws out.png. A machine without a GL of its own has nothing to test."""
+        result = self.with_assets("render", *arguments, "-o", "out.png", "--json", "--force")
+        if result.code == FAILED and "without a display" in result.err:
+            self.skipTest(result.err)
+        self.assertEqual(result.code, DONE, result.err)
+        self.facts = json.loads(result.out)
+        return Picture(self.read("out.png"))
+
+    def test_a_picture_has_the_size_that_was_asked_for_and_a_figure_in_its_middle(self):
+        for size, arguments in (((640, 480), ()), ((201, 99), ("--size", "201x99"))):
+            picture = self.render(WALK, *arguments)
+            self.assertEqual((picture.width, picture.height), size)
+            self.assertEqual((self.facts["width"], self.facts["height"]), size)
+            self.assertGreater(picture.drawn(0.3, 0, 0.7, 1), 100)
+            self.assertEqual(picture.drawn(0, 0, 0.2, 1), 0)
+
+    def test_frames_look_different_and_those_behind_the_end_like_the_end(self):
+        rows = [(frame, self.render(WALK, *SIZE, "--frame=%d" % frame).rows, self.facts["frame"])
+                for frame in (-7, 0, 20, 66, 67, 10**15)]
+        pixels = [row[1] for row in rows]
+        self.assertEqual([row[2] for row in rows], [0, 0, 20, 66, 66, 66])
+        self.assertEqual(pixels[0], pixels[1])
+        self.assertEqual(pixels[3], pixels[4])
+        self.assertEqual(pixels[3], pixels[5])
+        self.assertTrue(pixels[1] != pixels[2] != pixels[3])
+
+    def test_a_result_stands_beside_its_source_whatever_file_it_lies_in(self):
+        alone = self.render(WALK, *SIZE)
+        self.assertEqual(max(alone.drawn(0, 0, 0.3, 1), alone.drawn(0.7, 0, 1, 1)), 0)
+        halves = []
+        for name in ("walk.htr", "walk.Kinetra"):
+            self.succeed("convert", WALK, "-o", name)
+            both = self.render(WALK, *SIZE, "--with", name)
+            self.assertGreater(min(both.drawn(*LEFT), both.drawn(*RIGHT)), 50)
+            halves.append([row[240:] for row in both.rows])
+        self.assertEqual(halves[0], halves[1])
+        result = self.render("walk.Kinetra", "--size", "80x120")
+        self.assertEqual(result.rows, halves[0])
+
+    def test_a_strip_shows_the_way_from_the_frame_to_the_end(self):
+        strip = self.render(WALK, "--size", "400x120", "--strip", 4, "--frame", 6)
+        self.assertEqual((self.facts["poses"], self.facts["frame"]), (4, 6))
+        poses = [[row[300 * i:300 * (i + 1)] for row in strip.rows] for i in range(4)]
+        for i in range(4):
+            self.assertGreater(strip.drawn(i / 4, 0, (i + 1) / 4, 1), 50)
+        self.assertEqual(len({str(pose) for pose in poses}), 4)
+        two = self.render(WALK, "--size", "400x240", "--strip", 4, "--frame", 6, "--with", WALK)
+        self.assertEqual(two.rows[:120], strip.rows)
+        self.assertEqual(two.rows[120:], strip.rows)
+
+    def test_a_scene_shows_the_bones_of_the_root_that_moves(self):
+        scene = Container().node(8, "still", root=True)
+        scene.node(1, "hip", children=(2,), control=3, root=True).node(2, "knee", moved(0, -40, 0))
+        scene.track(3, 1, [(0, 90, 0), (40, 90, 0)])
+        self.write("moves.orn", scene.bytes)
+        self.assertGreater(self.render("moves.orn", *SIZE).drawn(0.3, 0, 0.7, 1), 50)
+
+
+class Refusals(CliTest):
+    def test_what_is_no_picture_is_refused_before_anything_is_written(self):
+        self.write("take.bvh", BVH)
+        self.write("still.orn", Container().node(1, "hip", root=True).bytes)
+        self.write("old.png", "old")
+        rows = [  # what, exit code, arguments, words
+            ("a size without a cross", USAGE, ["take.bvh", "--size", "640"], ['"640"', "640x480"]),
+            ("a size with something stuck to it", USAGE, ["take.bvh", "--size", "64x48px"], ["64x48px"]),
+            ("a side of nothing", USAGE, ["take.bvh", "--size", "0x48"], ["0x48", "8192"]),
+            ("a side that no renderer takes", USAGE, ["take.bvh", "--size", "8193x1"], ["8193x1", "8192"]),
+            ("no pose", USAGE, ["take.bvh", "--strip", "0"], ["--strip 0"]),
+            ("more poses than pixels", USAGE, ["take.bvh", "--size", "9x9", "--strip", "10"], ["10 poses", "9x9"]),
+            ("more poses than any number", USAGE, ["take.bvh", "--strip", "4294967297"], ["4294967297 poses"]),
+            ("another kind of picture", USAGE, ["take.bvh", "-o", "out.jpg"], ["out.jpg", ".png"]),
+            ("contrary wishes", USAGE, ["take.bvh", "--force", "--skip-existing"], ["exclude each other"]),
+            ("a picture that is there", FAILED, ["take.bvh", "-o", "old.png"], ["old.png", "--force"]),
+            ("no such motion", FAILED, ["none.bvh"], ["none.bvh"]),
+            ("no such result", FAILED, ["take.bvh", "--with", "none.htr"], ["none.htr"]),
+            ("a scene in which nothing moves", FAILED, ["still.orn"], ["still.orn", "no keyframes"]),
+            ("a folder that there is not", FAILED, ["take.bvh", "-o", "none/out.png"], ["none/out.png"]),
+        ]
+        before = self.files()
+        for what, code, arguments, words in rows:
+            with self.subTest(what):
+                output = [] if "-o" in arguments else ["-o", "out.png"]
+                result = self.run_program("render", *arguments, *output)
+                self.assertEqual((result.code, result.out), (code, ""), result.err)
+                if "without a display" not in result.err:
+                    self.assert_words(result, words)
+                self.assertEqual(self.files(), before)
+        self.assertEqual(self.read("old.png"), b"old")
+
+    def test_a_picture_that_is_there_is_passed_over_when_asked(self):
+        self.write("out.png", "old")
+        result = self.run_program("render", "none.bvh", "-o", "out.png", "--skip-existing", "--json")
+        self.assertEqual((result.code, json.loads(result.out)["outcome"]), (DONE, "skipped"), result.err)
+        self.assertEqual(self.read("out.png"), b"old")
+
+
+if __name__ == "__main__":
+    main()
