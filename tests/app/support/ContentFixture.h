@@ -60,6 +60,9 @@ public:
     void ShowInFileManager(const std::string& path) override { m_kCalls.push_back("show " + path); }
     void OpenHelpFile(const std::string& path) override { m_kCalls.push_back("help " + path); }
     bool OpenWebPage(const std::string& address) override;
+    void ShowProfileEditor(bool shown) override { m_kOnShowEditor(shown); }
+    void RefreshProfileEditor() override { m_kOnRefreshEditor(); }
+    bool RunBoneOffset(CBoneOffsetDialog& dialog) override { return m_kOnBoneOffset(dialog); }
 
     /// The enabled children, with blanks between them, in no order that matters.
     std::set<std::string> Enabled() const;
@@ -75,6 +78,9 @@ public:
     std::set<EKey> m_kKeys;
     std::function<void(const std::string& path)>
         m_kOnBatchFile; ///< what happens while a batch takes up a file
+    std::function<void(bool shown)> m_kOnShowEditor = [](bool) {};
+    std::function<void()> m_kOnRefreshEditor = [] {};
+    std::function<bool(CBoneOffsetDialog& dialog)> m_kOnBoneOffset = [](CBoneOffsetDialog&) { return false; };
     CProfileList m_kList;
     std::map<std::string, bool> m_kEnabled;
     std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"
