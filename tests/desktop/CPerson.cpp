@@ -1,0 +1,228 @@
+#include "CPerson.h"
+
+#include "Paths.h"
+#include "QtText.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QDropEvent>
+#include <QFileDialog>
+#include <QKeyEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QMimeData>
+#include <QOpenGLWidget>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QTest>
+#include <QTimer>
+#include <QUrl>
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+constexpr int kPatience = 5'000; // milliseconds
+constexpr int kLookInterval = 20;
+
+QKeyEvent KeyEvent(QEvent::Type type, EKey key)
+{
+    const bool isCtrl = key == EKey::LeftCtrl;
+    const Qt::KeyboardModifiers held = isCtrl ? Qt::ControlModifier : Qt::ShiftModifier;
+    return {type,
+            isCtrl ? Qt::Key_Control : Qt::Key_Shift,
+            type == QEvent::KeyPress ? held : Qt::NoModifier,
+            0,
+            static_cast<quint32>(isCtrl ? 0xffe3 : 0xffe1),
+            0};
+}
+
+} // namespace
+
+CTempHome::CTempHome()
+{
+    for (const char* name : {"HOME", "XDG_CONFIG_HOME", "XDG_CONFIG_DIRS", "XDG_RUNTIME_DIR"})
+        qputenv(name, m_kFolder.Path().c_str());
+}
+
+CPerson::CPerson()
+{
+    std::string problem;
+    EXPECT_TRUE(m_kSkin.Load(ExecutableFolder() + "Content", problem)) << problem;
+    qApp->setStyleSheet(m_kSkin.StyleSheet());
+    Start();
+}
+
+CPerson::~CPerson()
+{
+    EXPECT_EQ(m_kAnswers.size(), 0u) << "a window that was expected never came up";
+}
+
+void CPerson::Start()
+{
+    m_spPlatform = std::make_unique<CFilePlatform>(EPlatformWriting::Yes);
+    m_spFrame = std::make_unique<CGaitConvertFrame>(m_kSkin, m_kKeys, *m_spPlatform);
+    m_spFrame->show();
+    m_spFrame->activateWindow();
+    EXPECT_TRUE(QTest::qWaitForWindowExposed(m_spFrame.get()));
+}
+
+void CPerson::Restart()
+{
+    m_spFrame->close();
+    m_spFrame.reset();
+    Start();
+}
+
+QWidget* CPerson::Child(const char* name)
+{
+    auto* const child = m_spFrame->findChild<QWidget*>(QString::fromLatin1(name));
+    EXPECT_TRUE(child) << name;
+    return child;
+}
+
+bool CPerson::IsOn(const char* name)
+{
+    return Child(name)->isEnabled();
+}
+
+QString CPerson::Title()
+{
+    return Child("#title")->toolTip();
+}
+
+QString CPerson::Place()
+{
+    return static_cast<QLabel*>(Child("#frame"))->text();
+}
+
+QImage CPerson::Picture(const char* view)
+{
+    return static_cast<QOpenGLWidget*>(Child(view))->grabFramebuffer();
+}
+
+void CPerson::Click(const char* name)
+{
+    QTest::mouseClick(Child(name), Qt::LeftButton);
+}
+
+void CPerson::PressLeft(EKey key)
+{
+    QKeyEvent event = KeyEvent(QEvent::KeyPress, key);
+    QApplication::sendEvent(m_spFrame.get(), &event);
+}
+
+void CPerson::ReleaseLeft(EKey key)
+{
+    QKeyEvent event = KeyEvent(QEvent::KeyRelease, key);
+    QApplication::sendEvent(m_spFrame.get(), &event);
+}
+
+void CPerson::Type(int key, Qt::KeyboardModifiers modifiers)
+{
+    QTest::keyClick(m_spFrame->windowHandle(), static_cast<Qt::Key>(key), modifiers);
+}
+
+void CPerson::Drop(const std::string& path)
+{
+    QMimeData dropped;
+    dropped.setUrls({QUrl::fromLocalFile(ToQString(path))});
+    QDragEnterEvent enter(QPoint(300, 300), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(m_spFrame.get(), &enter);
+    ASSERT_TRUE(enter.isAccepted());
+    QDropEvent drop(QPointF(300, 300), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
+    QApplication::sendEvent(m_spFrame.get(), &drop);
+    Wait(50);
+}
+
+void CPerson::ChooseProfile(const QString& name)
+{
+    auto* const list = static_cast<QComboBox*>(Child("#format"));
+    const int index = list->findText(name);
+    ASSERT_GE(index, 0) << ToUtf8(name);
+    list->setCurrentIndex(index);
+    emit list->activated(index);
+}
+
+void CPerson::WillAnswer(const char* button)
+{
+    m_kAnswers.push_back([this, name = QString::fromLatin1(button)](QWidget& dialog) {
+        auto* const found = dialog.findChild<QPushButton*>(name);
+        if (!found)
+            return false;
+        const auto* text = dialog.findChild<QLabel*>(QStringLiteral("text"));
+        m_kBoxes << (text ? text->accessibleName() : QString());
+        const auto* details = dialog.findChild<QPlainTextEdit*>(QStringLiteral("detailsText"));
+        m_kDetails = details ? details->toPlainText() : QString();
+        QTest::mouseClick(found, Qt::LeftButton);
+        return true;
+    });
+    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
+}
+
+void CPerson::WillChooseFile(const std::string& path)
+{
+    m_kAnswers.push_back([path](QWidget& dialog) {
+        auto* const files = dynamic_cast<QFileDialog*>(&dialog);
+        if (!files)
+            return false;
+        if (path.empty())
+        {
+            files->reject();
+            return true;
+        }
+        files->findChild<QLineEdit*>(QStringLiteral("fileNameEdit"))->setText(ToQString(path));
+        QMetaObject::invokeMethod(files, "accept");
+        return true;
+    });
+    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
+}
+
+void CPerson::WillChooseFolder(const std::string& folder, int filter)
+{
+    m_kAnswers.push_back([folder, filter](QWidget& dialog) {
+        auto* const edit = dialog.findChild<QLineEdit*>(QStringLiteral("102"));
+        if (!edit)
+            return false;
+        if (auto* filters = dialog.findChild<QComboBox*>())
+            filters->setCurrentIndex(filter - 1);
+        edit->setText(ToQString(folder));
+        QMetaObject::invokeMethod(&dialog, "accept");
+        return true;
+    });
+    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
+}
+
+// Looks again and again: the window comes up some time, perhaps within a nested loop of events.
+void CPerson::AnswerNext()
+{
+    QWidget* const dialog = QApplication::activeModalWidget();
+    if (dialog && dialog->isVisible() && !m_kAnswers.empty())
+    {
+        // Taken first: clicking may run the next window's loop before it returns.
+        const Answer answer = m_kAnswers.front();
+        m_kAnswers.erase(m_kAnswers.begin());
+        if (answer(*dialog))
+            return;
+        m_kAnswers.insert(m_kAnswers.begin(), answer);
+    }
+    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
+}
+
+bool CPerson::WaitUntil(const std::function<bool()>& holds)
+{
+    return QTest::qWaitFor(holds, kPatience);
+}
+
+void CPerson::Wait(int milliseconds)
+{
+    QTest::qWait(milliseconds);
+}
+
+std::string ExampleFile(std::string_view name)
+{
+    return std::string(GAITWRIGHT_EXAMPLES "/") + std::string(name);
+}
+
+} // namespace gw

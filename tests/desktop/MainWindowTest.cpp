@@ -1,0 +1,274 @@
+#include "CPerson.h"
+#include "Paths.h"
+#include "QtText.h"
+
+#include <QApplication>
+#include <QMenu>
+#include <QSlider>
+#include <QTest>
+#include <fstream>
+#include <gmock/gmock.h>
+
+namespace gw {
+
+namespace {
+
+int ScrollValue(CPerson& person)
+{
+    return static_cast<QSlider*>(person.Child("|playbar"))->value();
+}
+
+void OpenWalk(CPerson& person)
+{
+    person.WillChooseFile(ExampleFile("walk.bvh"));
+    person.Click("open");
+}
+
+void OpenAndConvert(CPerson& person)
+{
+    OpenWalk(person);
+    person.Click("convert");
+    ASSERT_TRUE(person.Content().IsConverted());
+}
+
+bool ShowsSomething(const QImage& picture)
+{
+    const QRgb ground = picture.pixel(0, 0);
+    for (int y = 0; y < picture.height(); ++y)
+    {
+        for (int x = 0; x < picture.width(); ++x)
+        {
+            if (picture.pixel(x, y) != ground)
+                return true;
+        }
+    }
+    return false;
+}
+
+std::string CopyTo(const std::string& folder, const char* example, const char* name)
+{
+    WriteBytes(folder + name, ReadBytes(ExampleFile(example)));
+    return folder + name;
+}
+
+} // namespace
+
+TEST(MainWindow, AMotionIsOpenedConvertedPlayedAndSaved)
+{
+    CPerson person;
+    EXPECT_FALSE(person.IsOn("convert"));
+    EXPECT_FALSE(ShowsSomething(person.Picture("#cnt1")));
+    OpenWalk(person);
+    EXPECT_TRUE(ShowsSomething(person.Picture("#cnt1")));
+    EXPECT_FALSE(ShowsSomething(person.Picture("#cnt2")));
+    EXPECT_FALSE(person.IsOn("apply"));
+
+    person.Type(Qt::Key_Return, Qt::ControlModifier);
+    ASSERT_TRUE(person.IsOn("apply"));
+    const QImage first = person.Picture("#cnt2");
+    EXPECT_TRUE(ShowsSomething(first));
+
+    person.Type(Qt::Key_Space);
+    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) > 40; }));
+    EXPECT_NE(person.Picture("#cnt2"), first);
+    person.Type(Qt::Key_Space);
+    const int paused = ScrollValue(person);
+    person.Wait(60);
+    EXPECT_EQ(ScrollValue(person), paused);
+    person.Type(Qt::Key_End);
+    EXPECT_EQ(ScrollValue(person), 256);
+    EXPECT_TRUE(person.Place().startsWith(QStringLiteral("frame 66 of 66")));
+    person.Type(Qt::Key_Left);
+    EXPECT_TRUE(person.Place().startsWith(QStringLiteral("frame 65 of 66")));
+
+    const std::string saved = person.Home().Path("walk.Kinetra");
+    person.WillChooseFile(person.Home().Path("walk")); // the extension is the dialog's
+    person.WillAnswer("cancel");
+    person.Type(Qt::Key_S, Qt::ControlModifier);
+    EXPECT_TRUE(FileExists(saved));
+    EXPECT_EQ(person.Title(), QStringLiteral("Gaitwright v2.0"));
+}
+
+TEST(MainWindow, TheBarHoldsTheClockWhileItIsDragged)
+{
+    CPerson person;
+    OpenWalk(person);
+    auto* const bar = person.Child("|playbar");
+    const QPoint middle(bar->width() / 2, bar->height() / 2);
+    person.Click("play");
+    QTest::mousePress(bar, Qt::LeftButton, Qt::NoModifier, middle);
+    EXPECT_EQ(ScrollValue(person), 128);
+    person.Wait(80);
+    EXPECT_EQ(ScrollValue(person), 128);
+    QTest::mouseRelease(bar, Qt::LeftButton, Qt::NoModifier, middle);
+    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) > 140; })) << "plays on";
+    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) == 0; })) << "and stops at the start";
+}
+
+TEST(MainWindow, TheResultAlonePlaysOnlyWithTheClockOfBoth)
+{
+    CPerson person;
+    OpenAndConvert(person);
+    const QImage still = person.Picture("#cnt2");
+    person.Click("play1");
+    EXPECT_FALSE(person.IsOn("play1"));
+    EXPECT_TRUE(person.IsOn("stop1"));
+    person.Wait(150);
+    EXPECT_EQ(person.Picture("#cnt2"), still);
+    person.Click("play");
+    EXPECT_TRUE(person.WaitUntil([&] { return person.Picture("#cnt2") != still; }));
+}
+
+TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
+{
+    CPerson person;
+    OpenAndConvert(person);
+    person.WillAnswer("cancel");
+    person.Type(Qt::Key_O, Qt::ControlModifier);
+    EXPECT_TRUE(person.Content().IsConverted());
+
+    person.WillAnswer("cancel");
+    person.Click("exit");
+    person.Wait(60);
+    EXPECT_TRUE(person.Frame().isVisible());
+
+    person.WillAnswer("no");
+    person.Click("close");
+    EXPECT_TRUE(person.WaitUntil([&] { return !person.Frame().isVisible(); }));
+    EXPECT_EQ(person.m_kBoxes, QStringList(3, QStringLiteral("Save convertion result?")));
+}
+
+TEST(MainWindow, AProfileThatDoesNotFitSaysWhy)
+{
+    CPerson person;
+    OpenWalk(person);
+    person.ChooseProfile(QStringLiteral("Max BVH"));
+    person.WillAnswer("ok");
+    person.Click("convert");
+    EXPECT_FALSE(person.Content().IsConverted());
+    ASSERT_EQ(person.m_kBoxes.size(), 1);
+    EXPECT_EQ(person.m_kBoxes[0], QStringLiteral("Unable to convert motion with selected profile!"));
+    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("LeftCollar"));
+}
+
+TEST(MainWindow, ACustomProfileIsDroppedChosenAndDeleted)
+{
+    CPerson person;
+    const std::string folder = person.Content().ProfileFile({});
+    std::string text = ReadBytes(ExecutableFolder() + "PoserBVH.prf");
+    text.replace(0, text.find('\n'), "Mine");
+    WriteBytes(folder + "Custom0.prf", text);
+    OpenWalk(person);
+    person.Drop(folder + "Custom0.prf");
+    EXPECT_EQ(person.Content().ProfilePath(), folder + "Custom0.prf");
+    EXPECT_TRUE(person.IsOn("del"));
+    person.WillAnswer("ok");
+    person.Click("del");
+    EXPECT_FALSE(FileExists(folder + "Custom0.prf"));
+    EXPECT_FALSE(person.IsOn("del"));
+}
+
+TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
+{
+    CPerson person;
+    const std::string folder = person.Home().Path("takes/");
+    CreateFolder(folder);
+    CopyTo(folder, "walk.bvh", "a.BVH");
+    CopyTo(folder, "walk.bvh", "b.bvh");
+    person.ChooseProfile(QStringLiteral("Poser BVH"));
+    person.WillChooseFolder(folder, 1);
+    person.WillAnswer("ok");
+    person.PressLeft(EKey::LeftCtrl);
+    person.Click("open");
+    person.ReleaseLeft(EKey::LeftCtrl);
+    EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("2 BVH files are successful convert to HTR.")});
+    EXPECT_TRUE(FileExists(folder + "a.htr") && FileExists(folder + "b.htr"));
+
+    person.WillChooseFolder(folder, 2);
+    person.WillAnswer("ok");
+    person.Drop(folder);
+    EXPECT_EQ(person.m_kBoxes.back(), QStringLiteral("2 HTR files are successful convert to ORN."));
+    EXPECT_TRUE(FileExists(folder + "a.orn"));
+}
+
+TEST(MainWindow, RightKeysAreNotLeftKeys)
+{
+    CPerson person;
+    QKeyEvent right(QEvent::KeyPress, Qt::Key_Control, Qt::ControlModifier, 0, 0xffe4, 0);
+    QApplication::sendEvent(&person.Frame(), &right);
+    OpenWalk(person); // the batch would have asked for a folder
+    EXPECT_TRUE(person.Content().SourceRoot());
+}
+
+TEST(MainWindow, WhatIsDroppedOrRecentOpens)
+{
+    CPerson person;
+    person.Drop(ExampleFile("wave.bvh"));
+    person.Drop(ExampleFile("walk.bvh"));
+    EXPECT_TRUE(person.IsOn("convert"));
+    EXPECT_EQ(person.Content().RecentFiles().size(), 2u);
+    person.Restart();
+    QTest::mousePress(person.Child("face"), Qt::LeftButton, Qt::NoModifier, QPoint(3, 3));
+    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
+    auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
+    QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
+                      menu->actionGeometry(menu->actions()[1]).center());
+    EXPECT_TRUE(person.WaitUntil([&] { return person.IsOn("convert"); }));
+
+    const std::string broken = person.Home().Path("broken.bvh");
+    WriteBytes(broken, "HIERARCHY\nnothing");
+    person.WillAnswer("ok");
+    person.Drop(broken);
+    EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("Invalid BVH file format.")});
+    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("broken.bvh:2:"));
+    EXPECT_TRUE(person.IsOn("convert")) << "the source before stays";
+}
+
+TEST(MainWindow, ASecondClickOnTheCornerCloses)
+{
+    CPerson person;
+    auto* const face = person.Child("face");
+    QTest::mousePress(face, Qt::LeftButton, Qt::NoModifier, QPoint(3, 3));
+    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
+    QWidget* const menu = QApplication::activePopupWidget();
+    QTest::mousePress(menu, Qt::LeftButton, Qt::NoModifier,
+                      menu->mapFromGlobal(face->mapToGlobal(QPoint(3, 3))));
+    EXPECT_TRUE(person.WaitUntil([&] { return !person.Frame().isVisible(); }));
+}
+
+TEST(MainWindow, StandsWhereItWasClosedUnlessThatIsOffTheScreen)
+{
+    CPerson person;
+    auto* const title = person.Child("#title");
+    const QPoint before = person.Frame().pos();
+    QTest::mousePress(title, Qt::LeftButton, Qt::NoModifier, QPoint(50, 10));
+    QTest::mouseMove(title, QPoint(90, 35));
+    QTest::mouseMove(title, QPoint(90, 35));
+    QTest::mouseRelease(&person.Frame(), Qt::LeftButton, Qt::NoModifier, QPoint(50, 10));
+    const QPoint moved = person.Frame().pos();
+    EXPECT_NE(moved, before);
+    person.Restart();
+    EXPECT_EQ(person.Frame().pos(), moved);
+    EXPECT_EQ(person.Frame().size(), person.Child("face")->size());
+    person.Frame().move(5000, 5000);
+    person.Restart();
+    EXPECT_LT(person.Frame().x(), 1280);
+}
+
+TEST(MainWindow, EveryChildHasANameAndFitsItsText)
+{
+    CPerson person;
+    OpenAndConvert(person);
+    for (const QWidget* child :
+         person.Child("face")->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+    {
+        SCOPED_TRACE(ToUtf8(child->objectName()));
+        EXPECT_TRUE(person.Child("face")->rect().contains(child->geometry()));
+        const QString kind = child->property("kind").toString();
+        EXPECT_TRUE(!(child->focusPolicy() & Qt::TabFocus) || !child->accessibleName().isEmpty());
+        EXPECT_TRUE(kind == QStringLiteral("text") || kind == QStringLiteral("view") ||
+                    child->minimumSizeHint().width() <= child->width());
+    }
+}
+
+} // namespace gw
