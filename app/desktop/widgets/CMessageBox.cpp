@@ -1,0 +1,256 @@
+#include "CMessageBox.h"
+
+#include "QtText.h"
+
+#include <QBoxLayout>
+#include <QClipboard>
+#include <QCoreApplication>
+#include <QGuiApplication>
+#include <QLabel>
+#include <QPainter>
+#include <QPlainTextEdit>
+#include <QPushButton>
+#include <QScreen>
+#include <QToolButton>
+#include <algorithm>
+#include <span>
+
+namespace gw {
+
+namespace {
+
+struct ButtonRow
+{
+    EAnswer answer;
+    const char* name;
+    const char* text;
+};
+
+constexpr ButtonRow kOKRow{EAnswer::OK, "ok", QT_TRANSLATE_NOOP("CMessageBox", "&OK")};
+constexpr ButtonRow kCancelRow{EAnswer::Cancel, "cancel", QT_TRANSLATE_NOOP("CMessageBox", "&Cancel")};
+constexpr ButtonRow kYesRow{EAnswer::Yes, "yes", QT_TRANSLATE_NOOP("CMessageBox", "&Yes")};
+constexpr ButtonRow kNoRow{EAnswer::No, "no", QT_TRANSLATE_NOOP("CMessageBox", "&No")};
+
+constexpr ButtonRow kOKRows[] = {kOKRow};
+constexpr ButtonRow kOKCancelRows[] = {kOKRow, kCancelRow};
+constexpr ButtonRow kYesNoCancelRows[] = {kYesRow, kNoRow, kCancelRow};
+constexpr ButtonRow kYesNoRows[] = {kYesRow, kNoRow};
+
+std::span<const ButtonRow> RowsOf(EButtons buttons)
+{
+    switch (buttons)
+    {
+    case EButtons::OKCancel:
+        return kOKCancelRows;
+    case EButtons::YesNoCancel:
+        return kYesNoCancelRows;
+    case EButtons::YesNo:
+        return kYesNoRows;
+    case EButtons::OK:
+        break;
+    }
+    return kOKRows;
+}
+
+constexpr int kIconSide = 36;
+constexpr int kTextWidth = 440;
+constexpr int kButtonWidth = 84;
+constexpr int kMargin = 16;
+constexpr int kLeastWidth = 320;
+constexpr double kMostOfScreen = 0.6; // of its height, for the whole box
+
+QString Own(const char* text)
+{
+    return QCoreApplication::translate("CMessageBox", text);
+}
+
+template <class Widget>
+Widget* Named(Widget* widget, const char* name, const QString& accessibleName)
+{
+    widget->setObjectName(QLatin1String(name));
+    widget->setAccessibleName(accessibleName);
+    return widget;
+}
+
+// A ring around a letter, in the colour of the text.
+class CMessageIcon : public QWidget
+{
+public:
+    explicit CMessageIcon(QChar letter) : m_kLetter(letter) { setFixedSize(kIconSide, kIconSide); }
+
+protected:
+    void paintEvent(QPaintEvent*) override
+    {
+        QPainter painter(this);
+        painter.setRenderHint(QPainter::Antialiasing);
+        painter.setPen(QPen(palette().windowText(), 2));
+        painter.drawEllipse(QRectF(rect()).adjusted(2, 2, -2, -2));
+        QFont letters = font();
+        letters.setPixelSize(kIconSide / 2);
+        letters.setBold(true);
+        painter.setFont(letters);
+        painter.drawText(rect(), Qt::AlignCenter, m_kLetter);
+    }
+
+private:
+    QChar m_kLetter;
+};
+
+QWidget* MakeIcon(bool asks)
+{
+    auto* icon = new CMessageIcon(QLatin1Char(asks ? '?' : 'i'));
+    return Named(icon, "icon", asks ? Own("Question") : Own("Information"));
+}
+
+// A path is one long word, which a label would not wrap: it gets places to break at, which are not seen.
+QString Breakable(const QString& text)
+{
+    constexpr int kLongWord = 40;
+    constexpr QChar kBreak(0x200b);
+    QString result;
+    int run = 0;
+    for (const QChar letter : text)
+    {
+        result += letter;
+        run = letter.isSpace() ? 0 : run + 1;
+        const bool isSeparator = letter == QLatin1Char('/') || letter == QLatin1Char('\\');
+        if (run == 0 || !(isSeparator || run >= kLongWord) || letter.isHighSurrogate())
+            continue;
+        result += kBreak;
+        run = 0;
+    }
+    return result;
+}
+
+int WrappedHeight(const QWidget& widget, int width, const QString& text)
+{
+    const QRect room(0, 0, width, QWIDGETSIZE_MAX);
+    return widget.fontMetrics().boundingRect(room, Qt::TextWordWrap, Breakable(text)).height();
+}
+
+} // namespace
+
+CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
+                         const QString& details)
+    : QDialog(owner), m_eEscape(RowsOf(buttons).back().answer)
+{
+    Named(this, "messageBox", caption);
+    setWindowTitle(caption);
+    auto* top = new QHBoxLayout;
+    top->setSpacing(kMargin);
+    top->addWidget(MakeIcon(buttons != EButtons::OK), 0, Qt::AlignTop);
+    top->addWidget(MakeText(text), 1, Qt::AlignLeft | Qt::AlignVCenter);
+    auto* layout = new QVBoxLayout(this);
+    layout->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
+    layout->setSpacing(kMargin);
+    layout->setSizeConstraint(QLayout::SetFixedSize); // grows and shrinks with the details
+    layout->addLayout(top);
+    layout->addStrut(kLeastWidth);
+    if (!details.isEmpty())
+        layout->addWidget(MakeDetails(details));
+    layout->addLayout(MakeButtons(buttons, !details.isEmpty()));
+}
+
+QWidget* CMessageBox::MakeText(const QString& text)
+{
+    auto* label = Named(new QLabel(this), "text", text);
+    label->setTextFormat(Qt::PlainText);
+    label->setText(Breakable(text));
+    label->setWordWrap(true);
+    label->ensurePolished(); // the style sheet may change the font
+    const QSize screenSize = screen()->availableSize();
+    const int natural = label->fontMetrics().size(0, label->text()).width() + 1;
+    int width = std::min(natural, kTextWidth);
+    if (label->heightForWidth(width) > screenSize.height() / 3)
+        width = std::min(natural, screenSize.width() * 4 / 5);
+    label->setFixedSize(width, label->heightForWidth(width));
+    return label;
+}
+
+QWidget* CMessageBox::MakeDetails(const QString& details)
+{
+    m_pkDetails = Named(new QPlainTextEdit(details, this), "detailsText", Own("Details"));
+    m_pkDetails->setReadOnly(true);
+    m_pkDetails->setTabChangesFocus(true);
+    m_pkDetails->setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
+    m_pkDetails->setMinimumWidth(kIconSide + kMargin + kTextWidth);
+    m_pkDetails->hide();
+    return m_pkDetails;
+}
+
+QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
+{
+    auto* layout = new QHBoxLayout;
+    layout->addStretch();
+    layout->setSpacing(kMargin / 2);
+    for (const ButtonRow& row : RowsOf(buttons))
+    {
+        auto* button =
+            Named(new QPushButton(Own(row.text), this), row.name, Own(row.text).remove(QLatin1Char('&')));
+        button->setMinimumWidth(kButtonWidth);
+        button->setDefault(layout->count() == 1);
+        connect(button, &QPushButton::clicked, this, [this, &row] { done(static_cast<int>(row.answer)); });
+        layout->addWidget(button);
+    }
+    if (hasDetails)
+        AddDetailsButtons(*layout);
+    return layout;
+}
+
+// To the left of the others, and behind them in the order of the keyboard.
+void CMessageBox::AddDetailsButtons(QBoxLayout& layout)
+{
+    auto* fold = Named(new QToolButton(this), "details", Own("Details"));
+    fold->setText(Own("&Details"));
+    fold->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+    fold->setArrowType(Qt::RightArrow);
+    fold->setCheckable(true);
+    fold->setFocusPolicy(Qt::StrongFocus);
+    auto* copy = Named(new QPushButton(Own("Co&py"), this), "copy", Own("Copy the details"));
+    copy->setAutoDefault(false);
+    copy->hide();
+    connect(fold, &QToolButton::toggled, this, [this, fold, copy](bool visible) {
+        fold->setArrowType(visible ? Qt::DownArrow : Qt::RightArrow);
+        copy->setVisible(visible);
+        ShowDetails(visible);
+    });
+    connect(copy, &QPushButton::clicked, this,
+            [this] { QGuiApplication::clipboard()->setText(m_pkDetails->toPlainText()); });
+    layout.insertWidget(0, fold);
+    layout.insertWidget(1, copy);
+}
+
+void CMessageBox::ShowDetails(bool visible)
+{
+    if (visible)
+    {
+        const int margins = 2 * kMargin;
+        const int least = 4 * m_pkDetails->fontMetrics().lineSpacing();
+        const int most =
+            static_cast<int>(kMostOfScreen * screen()->availableSize().height()) - height() - margins;
+        const int wanted =
+            WrappedHeight(*m_pkDetails, m_pkDetails->minimumWidth() - margins, m_pkDetails->toPlainText()) +
+            margins;
+        m_pkDetails->setFixedHeight(std::clamp(wanted, least, std::max(least, most)));
+    }
+    m_pkDetails->setVisible(visible);
+}
+
+EAnswer CMessageBox::Run()
+{
+    return static_cast<EAnswer>(exec());
+}
+
+void CMessageBox::reject()
+{
+    done(static_cast<int>(m_eEscape));
+}
+
+EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
+                      const std::string& details)
+{
+    CMessageBox box(owner, ToQString(caption), ToQString(text), buttons, ToQString(details));
+    return box.Run();
+}
+
+} // namespace gw

@@ -1,0 +1,42 @@
+#pragma once
+
+#include "CProfileOwner.h"
+
+#include <QDialog>
+#include <string>
+
+class QBoxLayout;
+class QPlainTextEdit;
+
+namespace gw {
+
+/// The program's message box: a text, its buttons, and details that fold out under the text. All texts are
+/// plain, whatever is in a file's name. Enter presses the first button; Escape and the close box press the
+/// last one, which is the most careful one of each set.
+class CMessageBox : public QDialog
+{
+public:
+    CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
+                const QString& details);
+
+    /// Shows it until it is answered.
+    EAnswer Run();
+
+    void reject() override;
+
+private:
+    QWidget* MakeText(const QString& text);
+    QWidget* MakeDetails(const QString& details);
+    QLayout* MakeButtons(EButtons buttons, bool hasDetails);
+    void AddDetailsButtons(QBoxLayout& layout);
+    void ShowDetails(bool visible);
+
+    EAnswer m_eEscape;
+    QPlainTextEdit* m_pkDetails = nullptr;
+};
+
+/// Shows a message box until it is answered. Without details there is nothing to fold out.
+EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
+                      const std::string& details = {});
+
+} // namespace gw

@@ -1,0 +1,149 @@
+// Questions and words: what each set of buttons answers to hand, keyboard and close box.
+
+#include "CMessageBox.h"
+
+#include <QAbstractButton>
+#include <QApplication>
+#include <QClipboard>
+#include <QLabel>
+#include <QPlainTextEdit>
+#include <QScreen>
+#include <QTest>
+#include <QTimer>
+#include <functional>
+#include <gtest/gtest.h>
+
+namespace gw {
+namespace {
+
+using Act = std::function<void(QWidget&)>;
+
+// Shows a box, does something to it once it stands, and answers what it was answered with.
+EAnswer Ask(EButtons buttons, const Act& act, const std::string& text = "Text",
+            const std::string& details = {})
+{
+    QTimer::singleShot(0, qApp, [&] {
+        QWidget* box = QApplication::activeModalWidget();
+        ASSERT_TRUE(box && QTest::qWaitForWindowActive(box));
+        act(*box);
+    });
+    return RunMessageBox(nullptr, "Caption", text, buttons, details);
+}
+
+QAbstractButton* Button(QWidget& box, const char* name)
+{
+    return box.findChild<QAbstractButton*>(QLatin1String(name));
+}
+
+Act Press(const char* name)
+{
+    return [name](QWidget& box) { QTest::mouseClick(Button(box, name), Qt::LeftButton); };
+}
+
+Act Key(Qt::Key key)
+{
+    return [key](QWidget& box) { QTest::keyClick(&box, key); };
+}
+
+TEST(MessageBox, EveryButtonAnswersForItself)
+{
+    const struct
+    {
+        EButtons buttons;
+        const char* name;
+        EAnswer answer;
+    } rows[] = {
+        {EButtons::OK,          "ok",     EAnswer::OK    },
+        {EButtons::OKCancel,    "ok",     EAnswer::OK    },
+        {EButtons::OKCancel,    "cancel", EAnswer::Cancel},
+        {EButtons::YesNoCancel, "yes",    EAnswer::Yes   },
+        {EButtons::YesNoCancel, "no",     EAnswer::No    },
+        {EButtons::YesNoCancel, "cancel", EAnswer::Cancel},
+        {EButtons::YesNo,       "yes",    EAnswer::Yes   },
+        {EButtons::YesNo,       "no",     EAnswer::No    },
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(Ask(row.buttons, Press(row.name)), row.answer) << row.name;
+}
+
+TEST(MessageBox, EnterAnswersFirstAndWhatClosesAnswersMostCarefully)
+{
+    const struct
+    {
+        EButtons buttons;
+        EAnswer enter;
+        EAnswer escape;
+    } rows[] = {
+        {EButtons::OK,          EAnswer::OK,  EAnswer::OK    },
+        {EButtons::OKCancel,    EAnswer::OK,  EAnswer::Cancel},
+        {EButtons::YesNoCancel, EAnswer::Yes, EAnswer::Cancel},
+        {EButtons::YesNo,       EAnswer::Yes, EAnswer::No    },
+    };
+    for (const auto& row : rows)
+    {
+        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Return)), row.enter);
+        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Enter), "Text", "Details"), row.enter);
+        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Escape)), row.escape);
+        EXPECT_EQ(Ask(row.buttons, [](QWidget& box) { box.close(); }), row.escape);
+    }
+}
+
+// A box at a moment: how large it is, and what of its parts is not where all of it can be seen.
+void ExpectAllInside(const QWidget& box)
+{
+    EXPECT_TRUE(box.screen()->availableGeometry().contains(box.geometry()));
+    for (const QWidget* child : box.findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+    {
+        EXPECT_TRUE(!child->isVisible() || box.rect().contains(child->geometry()))
+            << qPrintable(child->objectName());
+    }
+}
+
+TEST(MessageBox, TextsOfFilesArePlainAndNeverCut)
+{
+    const std::string path = "<b>x</b> Tom & Jerry\n/" + std::string(4000, 'm');
+    Ask(
+        EButtons::OK,
+        [&](QWidget& box) {
+            const auto* label = box.findChild<QLabel*>(QStringLiteral("text"));
+            EXPECT_EQ(label->textFormat(), Qt::PlainText);
+            EXPECT_EQ(label->accessibleName().toStdString(), path);
+            EXPECT_GE(label->height(), label->heightForWidth(label->width()));
+            // Every letter has its place: a label that cannot wrap would be wider than it is.
+            EXPECT_LE(label->minimumSizeHint().width(), label->width());
+            ExpectAllInside(box);
+            box.close();
+        },
+        path);
+}
+
+TEST(MessageBox, DetailsFoldOutUnderTheTextAndScroll)
+{
+    std::string details;
+    for (int line = 0; line < 500; ++line)
+        details += "take.bvh:" + std::to_string(line) + ": a number with something stuck to it\n";
+    Ask(
+        EButtons::YesNo,
+        [&](QWidget& box) {
+            const int folded = box.height();
+            auto* text = box.findChild<QPlainTextEdit*>();
+            EXPECT_FALSE(text->isVisible() || Button(box, "copy")->isVisible());
+            Press("details")(box);
+            EXPECT_TRUE(QTest::qWaitFor([&] { return box.height() > folded + 100; }));
+            EXPECT_LE(box.height(), box.screen()->availableSize().height() * 6 / 10 + 1);
+            ExpectAllInside(box);
+            Press("copy")(box);
+            EXPECT_EQ(QApplication::clipboard()->text().toStdString(), details);
+            Press("details")(box);
+            EXPECT_TRUE(QTest::qWaitFor([&] { return box.height() == folded; }));
+            box.close();
+        },
+        "Text", details);
+    Ask(EButtons::OK, [](QWidget& box) {
+        EXPECT_EQ(Button(box, "details"), nullptr);
+        box.close();
+    });
+}
+
+} // namespace
+} // namespace gw
