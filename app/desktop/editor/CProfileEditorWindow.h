@@ -1,12 +1,14 @@
 #pragma once
 
+#include "CEditorControls.h"
+
 #include <QDialog>
 
 namespace gw {
 
 class CBoneOffsetDialog;
-class CGaitConvertContent;
 class CPlatform;
+class CProfileEditorDialog;
 
 /// The window of the profile editor: shows what the model answers, forwards what the user does. Modeless; the
 /// main window's toggle shows and hides it.
@@ -24,6 +26,37 @@ public:
     /// Runs the dialog that edits one row, modal to this window if it is visible, else to the owner. True on
     /// OK.
     bool RunBoneOffset(CBoneOffsetDialog& dialog);
+
+    /// Escape, and the window's own close button: commits the field that is being edited and closes.
+    void reject() override;
+
+protected:
+    void keyPressEvent(QKeyEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void ConnectFields();
+    void ConnectTrees();
+    void ConnectRows();
+    void ConnectButtons();
+    void AddShortcuts();
+    CProfileEditorDialog& Model() const;
+    void LeaveField();
+    void OpenFilter();
+    void CloseFilter();
+    void RestorePlace();
+    void Hide();
+    void Redraw();
+    void ShowTrees();
+    void ShowFieldsAndButtons();
+    void ShowPair();
+
+    CGaitConvertContent& m_kContent;
+    CPlatform& m_kPlatform;
+    CEditorControls m_kControls;
+    bool m_bPlaced = false;
+    bool m_bRedrawQueued = false;
+    bool m_bLeavingField = false;
 };
 
 } // namespace gw

@@ -1,0 +1,38 @@
+#pragma once
+
+#include <QDialog>
+#include <array>
+
+class QComboBox;
+
+namespace gw {
+
+class CBoneOffsetDialog;
+class CFieldEdit;
+class CGaitConvertContent;
+
+/// The window of the dialog that edits rotation and axes of one row.
+class CBoneOffsetWindow : public QDialog
+{
+public:
+    /// The content names the fields. The dialog holds the numbers and must outlive the window.
+    CBoneOffsetWindow(const CGaitConvertContent& content, CBoneOffsetDialog& dialog, QWidget* owner);
+
+    void accept() override;
+
+private:
+    static constexpr int kAxisCount = 3;
+
+    QLayout* MakeNumbers(const CGaitConvertContent& content);
+    CFieldEdit* MakeRotation(int axis);
+    QComboBox* MakeAxis(int axis);
+    QLayout* MakeButtons();
+    void LeaveRotation(int axis);
+    void ShowNumbers();
+
+    CBoneOffsetDialog& m_kDialog;
+    std::array<CFieldEdit*, kAxisCount> m_pkRotation{};
+    std::array<QComboBox*, kAxisCount> m_pkAxis{};
+};
+
+} // namespace gw

@@ -1,0 +1,216 @@
+#include "CEditorControls.h"
+
+#include "CBoneTreeView.h"
+#include "CFieldEdit.h"
+#include "CMapRowView.h"
+#include "CProfileEditorDialog.h"
+
+#include <QCoreApplication>
+#include <QGroupBox>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QPushButton>
+#include <QVBoxLayout>
+#include <algorithm>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+struct ButtonRow
+{
+    int id;
+    const char* text;
+    bool CProfileButtons::*enabled;
+};
+
+constexpr ButtonRow kButtonRows[] = {
+    {kAddToMapButton,    "Add to Map",   &CProfileButtons::addToMap   },
+    {kBoneOffsetButton,  "Bone Offset",  &CProfileButtons::boneOffset },
+    {kRemoveButton,      "Remove",       &CProfileButtons::remove     },
+    {kRemoveAllButton,   "Remove All",   &CProfileButtons::removeAll  },
+    {kSaveProfileButton, "Save Profile", &CProfileButtons::saveProfile},
+};
+
+// Controls that the window has and never shows. The offset that a file gives goes through the fields.
+constexpr ButtonRow kUnusedButtons[] = {
+    {3, "Auto-Mapping", nullptr},
+    {4, "Auto-Offset",  nullptr},
+};
+constexpr int kUnusedFields[] = {kOffsetXField, kOffsetYField, kOffsetZField};
+
+constexpr int kTreeStretch = 3;
+constexpr int kRowStretch = 2;
+
+QString Name(int id)
+{
+    return QString::number(id);
+}
+
+QString Translated(const char* text)
+{
+    return QCoreApplication::translate("QObject", text);
+}
+
+// A label on the left and a hint on the right of one line.
+QLayout* Heading(QLabel* label, QLabel* hint)
+{
+    auto* const line = new QHBoxLayout;
+    line->addWidget(label);
+    line->addStretch();
+    line->addWidget(hint);
+    return line;
+}
+
+} // namespace
+
+CEditorControls::CEditorControls(const CGaitConvertContent& content, QWidget* window) : m_pkWindow(window)
+{
+    auto* const layout = new QVBoxLayout(window);
+    layout->addLayout(MakeFields());
+    layout->addWidget(MakeFilterLine());
+    layout->addLayout(MakeTrees(), kTreeStretch);
+    layout->addLayout(MakePairLine());
+    layout->addLayout(MakeRows(content), kRowStretch);
+    layout->addLayout(MakeRowButtons());
+    MakeUnusedControls();
+}
+
+QLayout* CEditorControls::MakeFields()
+{
+    CFieldEdit* const name = MakeField(kNameField, QObject::tr("Profile Name:"));
+    CFieldEdit* const rate = MakeField(kFrameRateField, QObject::tr("Frame Rate:"));
+    rate->setAlignment(Qt::AlignRight);
+    rate->setFixedWidth(rate->fontMetrics().horizontalAdvance(QStringLiteral("000000000")));
+    auto* const line = new QHBoxLayout;
+    line->addWidget(MakeLabel(QObject::tr("Profile Name:"), name));
+    line->addWidget(name);
+    line->addSpacing(name->fontMetrics().height());
+    line->addWidget(MakeLabel(QObject::tr("Frame Rate:"), rate));
+    line->addWidget(rate);
+    return line;
+}
+
+QWidget* CEditorControls::MakeFilterLine()
+{
+    m_pkFilterLine = new QWidget(m_pkWindow);
+    m_pkFilterLine->setObjectName(QStringLiteral("filterLine"));
+    m_pkFilter = new CFieldEdit(m_pkFilterLine);
+    m_pkFilter->setObjectName(QStringLiteral("filter"));
+    m_pkFilter->setAccessibleName(QObject::tr("Find Bone:"));
+    m_pkFilter->setClearButtonEnabled(true);
+    auto* const line = new QHBoxLayout(m_pkFilterLine);
+    line->setContentsMargins({});
+    line->addWidget(MakeLabel(QObject::tr("Find Bone:"), m_pkFilter));
+    line->addWidget(m_pkFilter);
+    m_pkFilterLine->hide();
+    return m_pkFilterLine;
+}
+
+QLayout* CEditorControls::MakeTrees()
+{
+    auto* const line = new QHBoxLayout;
+    line->addLayout(MakeTree(m_pkSourceTree, kSourceTree, QObject::tr("Source Bones:"), {}));
+    line->addLayout(
+        MakeTree(m_pkTargetTree, kTargetTree, QObject::tr("Kestro TK Bones:"), QObject::tr("Find: Ctrl+F")));
+    return line;
+}
+
+QLayout* CEditorControls::MakeTree(CBoneTreeView*& tree, int id, const QString& title, const QString& hint)
+{
+    tree = new CBoneTreeView(m_pkWindow);
+    tree->setObjectName(Name(id));
+    tree->setAccessibleName(title);
+    auto* const column = new QVBoxLayout;
+    column->addLayout(Heading(MakeLabel(title, tree), MakeHint(hint, QStringLiteral("findHint"))));
+    column->addWidget(tree);
+    return column;
+}
+
+QLayout* CEditorControls::MakePairLine()
+{
+    m_pkPair = new QLabel(m_pkWindow);
+    m_pkPair->setObjectName(QStringLiteral("pair"));
+    m_pkPair->setAccessibleName(QObject::tr("Bones to map"));
+    m_pkPair->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred); // the text takes what there is
+    auto* const line = new QHBoxLayout;
+    line->addWidget(m_pkPair, 1);
+    line->addWidget(MakeButton(kAddToMapButton));
+    return line;
+}
+
+QLayout* CEditorControls::MakeRows(const CGaitConvertContent& content)
+{
+    const QString title = QObject::tr("Bone Map List:");
+    m_pkRows = new CMapRowView(content, m_pkWindow);
+    m_pkRows->setObjectName(Name(kMapRowList));
+    m_pkRows->setAccessibleName(title);
+    QLabel* const hint = MakeHint(QObject::tr("Undo: Ctrl+Z    Redo: Ctrl+Y"), QStringLiteral("undoHint"));
+    auto* const column = new QVBoxLayout;
+    column->addLayout(Heading(MakeLabel(title, m_pkRows), hint));
+    column->addWidget(m_pkRows);
+    return column;
+}
+
+QLayout* CEditorControls::MakeRowButtons()
+{
+    auto* const line = new QHBoxLayout;
+    for (const int id : {kBoneOffsetButton, kRemoveButton, kRemoveAllButton})
+        line->addWidget(MakeButton(id));
+    line->addStretch();
+    line->addWidget(MakeButton(kSaveProfileButton));
+    return line;
+}
+
+void CEditorControls::MakeUnusedControls()
+{
+    for (const ButtonRow& row : kUnusedButtons)
+    {
+        auto* const button = new QPushButton(Translated(row.text), m_pkWindow);
+        button->setObjectName(Name(row.id));
+        button->hide();
+    }
+    auto* const group = new QGroupBox(QObject::tr("Root Offset:"), m_pkWindow);
+    group->setObjectName(QStringLiteral("rootOffset"));
+    for (const int id : kUnusedFields)
+        MakeField(id, group->title())->setParent(group);
+    group->hide();
+}
+
+CFieldEdit* CEditorControls::MakeField(int id, const QString& name)
+{
+    auto* const edit = new CFieldEdit(m_pkWindow);
+    edit->setObjectName(Name(id));
+    edit->setAccessibleName(name);
+    m_kFields.push_back({id, edit});
+    return edit;
+}
+
+QPushButton* CEditorControls::MakeButton(int id)
+{
+    const ButtonRow& row = *std::ranges::find(kButtonRows, id, &ButtonRow::id);
+    auto* const button = new QPushButton(Translated(row.text), m_pkWindow);
+    button->setObjectName(Name(id));
+    button->setAutoDefault(false); // the Enter key is the fields'
+    m_kButtons.push_back({id, row.enabled, button});
+    return button;
+}
+
+QLabel* CEditorControls::MakeLabel(const QString& text, QWidget* buddy)
+{
+    auto* const label = new QLabel(text, m_pkWindow);
+    label->setObjectName(QStringLiteral("label-") + buddy->objectName());
+    label->setBuddy(buddy);
+    return label;
+}
+
+QLabel* CEditorControls::MakeHint(const QString& text, const QString& name)
+{
+    auto* const hint = new QLabel(text, m_pkWindow);
+    hint->setObjectName(name);
+    hint->setEnabled(false); // said quietly
+    return hint;
+}
+
+} // namespace gw

@@ -1,0 +1,125 @@
+#include "CMapRowView.h"
+
+#include "CGaitConvertContent.h"
+#include "CMapRowModel.h"
+#include "QtText.h"
+
+#include <QHeaderView>
+#include <QMouseEvent>
+#include <QScopedValueRollback>
+
+namespace gw {
+
+namespace {
+
+constexpr int kRowMargin = 6; // pixels above and below a row's text, together
+
+QStringList Titles(const CGaitConvertContent& content)
+{
+    QStringList titles;
+    for (const CMapColumnTitle& column : kMapColumnTitles)
+        titles << (column.messageId ? ToQString(content.Message(column.messageId)) : QStringLiteral(" "));
+    return titles;
+}
+
+} // namespace
+
+CMapRowView::CMapRowView(const CGaitConvertContent& content, QWidget* parent)
+    : QTableView(parent), m_pkModel(new CMapRowModel(Titles(content), this))
+{
+    setModel(m_pkModel);
+    setSelectionBehavior(SelectRows);
+    setSelectionMode(ExtendedSelection);
+    setEditTriggers(NoEditTriggers);
+    setTabKeyNavigation(false);
+    setShowGrid(false);
+    setWordWrap(false);
+    setTextElideMode(Qt::ElideMiddle);
+    // The columns are as wide as the table, and a little wider for the one that only fills.
+    setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
+    horizontalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    horizontalHeader()->setMinimumSectionSize(1);
+    horizontalHeader()->setHighlightSections(false);
+    horizontalHeader()->setSectionsClickable(false);
+    verticalHeader()->setSectionResizeMode(QHeaderView::Fixed);
+    verticalHeader()->setDefaultSectionSize(fontMetrics().height() + kRowMargin);
+    verticalHeader()->hide();
+}
+
+void CMapRowView::ShowRows(const CMapRowTable& rows)
+{
+    const QScopedValueRollback showing(m_bShowing, true);
+    m_pkModel->ShowRows(rows);
+    ShowSelection(rows);
+}
+
+void CMapRowView::ShowSelection(const CMapRowTable& rows)
+{
+    QItemSelection wanted;
+    bool same = true;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        const QModelIndex index = m_pkModel->index(row, 0);
+        const bool selected = rows.IsSelected(row);
+        same = same && selected == selectionModel()->isSelected(index);
+        if (selected)
+            wanted.select(index, index);
+    }
+    if (!same)
+        selectionModel()->select(wanted, QItemSelectionModel::ClearAndSelect | QItemSelectionModel::Rows);
+}
+
+void CMapRowView::TellSelection(const QItemSelection& rows, bool selected)
+{
+    for (const QItemSelectionRange& range : rows)
+    {
+        for (int row = range.top(); row <= range.bottom(); ++row)
+            m_kCallbacks.m_kSelect(row, selected);
+    }
+}
+
+void CMapRowView::selectionChanged(const QItemSelection& selected, const QItemSelection& deselected)
+{
+    QTableView::selectionChanged(selected, deselected);
+    if (m_bShowing)
+        return;
+    m_bSelectionChanged = true;
+    TellSelection(deselected, false);
+    TellSelection(selected, true);
+}
+
+void CMapRowView::mouseReleaseEvent(QMouseEvent* event)
+{
+    QTableView::mouseReleaseEvent(event);
+    if (event->button() == Qt::LeftButton)
+        m_kCallbacks.m_kClick(indexAt(event->position().toPoint()).row());
+}
+
+void CMapRowView::mouseDoubleClickEvent(QMouseEvent* event)
+{
+    QTableView::mouseDoubleClickEvent(event);
+    const int row = indexAt(event->position().toPoint()).row();
+    if (event->button() == Qt::LeftButton && row >= 0)
+        m_kCallbacks.m_kDoubleClick(row);
+}
+
+// A selection by keyboard is a click on the row that it ends on: a list that only the mouse can use is none.
+void CMapRowView::keyPressEvent(QKeyEvent* event)
+{
+    m_bSelectionChanged = false;
+    QTableView::keyPressEvent(event);
+    if (m_bSelectionChanged)
+        m_kCallbacks.m_kClick(currentIndex().row());
+}
+
+void CMapRowView::resizeEvent(QResizeEvent* event)
+{
+    QTableView::resizeEvent(event);
+    for (int column = 0; column < m_pkModel->columnCount(); ++column)
+    {
+        const CMapColumnTitle& title = kMapColumnTitles[column];
+        setColumnWidth(column, width() * title.widthNumerator / title.widthDenominator);
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,47 @@
+#pragma once
+
+#include <QTableView>
+#include <functional>
+
+namespace gw {
+
+class CGaitConvertContent;
+class CMapRowModel;
+class CMapRowTable;
+
+/// The editor's list of rows on the screen. Whole rows are selected, several at once.
+class CMapRowView : public QTableView
+{
+public:
+    struct Callbacks
+    {
+        std::function<void(int row, bool selected)> m_kSelect; ///< once for each row that changed
+        std::function<void(int row)> m_kClick;                 ///< after the selection; -1 for none
+        std::function<void(int row)> m_kDoubleClick;
+    };
+
+    /// The content names the columns.
+    CMapRowView(const CGaitConvertContent& content, QWidget* parent);
+
+    void SetCallbacks(Callbacks callbacks) { m_kCallbacks = std::move(callbacks); }
+    /// Shows a table and its selection as they stand.
+    void ShowRows(const CMapRowTable& rows);
+
+protected:
+    void selectionChanged(const QItemSelection& selected, const QItemSelection& deselected) override;
+    void mouseReleaseEvent(QMouseEvent* event) override;
+    void mouseDoubleClickEvent(QMouseEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+    void resizeEvent(QResizeEvent* event) override;
+
+private:
+    void ShowSelection(const CMapRowTable& rows);
+    void TellSelection(const QItemSelection& rows, bool selected);
+
+    CMapRowModel* m_pkModel;
+    Callbacks m_kCallbacks;
+    bool m_bShowing = false;          ///< changes come from the table and not from the user
+    bool m_bSelectionChanged = false; ///< since a key went down
+};
+
+} // namespace gw
