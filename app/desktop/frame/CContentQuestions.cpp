@@ -8,7 +8,6 @@
 
 #include <QFileDialog>
 #include <QGuiApplication>
-#include <QMessageBox>
 
 namespace gw {
 
