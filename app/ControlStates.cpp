@@ -100,11 +100,11 @@ std::string PlaceText(const CMotionView* view)
     if (!view || !(view->GetFrameStep() > 0.0f) || !(view->GetLastFrame() > 0.0f))
         return {};
     const float frame = std::round(view->GetTime() / view->GetFrameStep());
-    const std::string hundredths = std::to_string(std::llround(100.0f * frame / view->GetFrameStep()));
-    const std::string digits = std::string(3 - std::min<size_t>(hundredths.size(), 3), '0') + hundredths;
-    return "frame " + std::to_string(std::llround(frame)) + " of " +
-           std::to_string(std::llround(view->GetLastFrame())) + "   " + digits.substr(0, digits.size() - 2) +
-           '.' + digits.substr(digits.size() - 2) + " s";
+    const long long hundredths = std::llround(100.0f * frame / view->GetFrameStep());
+    std::string text = "frame ";
+    text += std::to_string(std::llround(frame)) + " of " + std::to_string(std::llround(view->GetLastFrame()));
+    text += "   " + std::to_string(hundredths / 100) + (hundredths % 100 < 10 ? ".0" : ".");
+    return text + std::to_string(hundredths % 100) + " s";
 }
 
 } // namespace

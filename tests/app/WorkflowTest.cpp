@@ -241,4 +241,49 @@ TEST_F(ContentTest, ClosingAsksTheEditorFirst)
     EXPECT_EQ(m_kWindow.TakeCalls(), (std::vector<std::string>{"box 161", "box 139"}));
 }
 
+TEST_F(ContentTest, DropsAndRecentFilesOpenAsTheDialogDoes)
+{
+    const std::string walk = Write("walk.bvh", BvhText(kPoserBones));
+    const std::string profile = Write("Mine.prf", BoneMapText("Dropped", kPoserBones));
+    EXPECT_EQ(m_kContent.OpenDropped(m_kFolder.Path("gone.bvh")), 0);
+    EXPECT_TRUE(m_kContent.RecentFiles().empty());
+    EXPECT_EQ(m_kContent.OpenDropped(walk), 1);
+    EXPECT_EQ(m_kContent.OpenDropped(profile), 1);
+    EXPECT_EQ(SelectedProfile(), "Dropped");
+    EXPECT_EQ(m_kContent.OpenDropped(m_kFolder.Path("data")), 0) << "asks for the folder, which is cancelled";
+    for (int i = 0; i < 9; ++i)
+        m_kContent.OpenFile(Write("walk" + std::to_string(i) + ".bvh", BvhText(kPoserBones)));
+    m_kContent.OpenFile(walk);
+    ASSERT_EQ(m_kContent.RecentFiles().size(), 8u);
+    EXPECT_EQ(m_kContent.RecentFiles().front(), walk);
+    EXPECT_EQ(m_kContent.RecentFiles().back(), m_kFolder.Path("walk2.bvh"));
+
+    Do("click convert");
+    m_kWindow.m_kAnswers[139] = EAnswer::Cancel;
+    EXPECT_EQ(m_kContent.OpenDropped(walk), 0);
+    EXPECT_TRUE(m_kContent.IsConverted());
+}
+
+TEST_F(ContentTest, ThePlaceIsToldInFramesAndSeconds)
+{
+    Write("walk.bvh", BvhText(kPoserBones, 301));
+    EXPECT_EQ(m_kWindow.m_kPlace, "");
+    Do("open walk.bvh, click fend");
+    EXPECT_EQ(m_kWindow.m_kPlace, "frame 1 of 300   0.03 s");
+    Do("click end");
+    EXPECT_EQ(m_kWindow.m_kPlace, "frame 300 of 300   10.00 s");
+}
+
+TEST_F(ContentTest, ALongConversionTellsItsProgressInTheTitle)
+{
+    Write("walk.bvh", BvhText(kPoserBones, 200));
+    Do("open walk.bvh");
+    m_kWindow.m_bProgressDue = true;
+    m_kWindow.m_kTitles.clear();
+    Do("click convert");
+    ASSERT_GE(m_kWindow.m_kTitles.size(), 3u);
+    EXPECT_EQ(m_kWindow.m_kTitles[1], "Gaitwright v2.0 - Converting 32 %");
+    EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+}
+
 } // namespace gw

@@ -3,6 +3,7 @@
 #include "CGLView.h"
 #include "CGaitConvertContent.h"
 #include "CLeftKeys.h"
+#include "CMessageBox.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
 #include "CProfileEditorWindow.h"
@@ -10,6 +11,7 @@
 #include "FaceChildren.h"
 #include "FailureWords.h"
 #include "QtText.h"
+#include "StringTable.h"
 
 #include <QApplication>
 #include <QComboBox>
@@ -118,14 +120,12 @@ void CContent::Report(const CReport& report)
     m_kReports.push_back(report);
 }
 
-// One line for each thing that was reported; they are not shown twice.
-std::string CContent::TakeNotes()
+// One line for each thing that was reported.
+std::string CContent::Notes() const
 {
     std::string text;
     for (const CReport& report : m_kReports)
-        text += ReportLine(report) + '\n';
-    m_kReports.clear();
-    ShowNotes();
+        text += (text.empty() ? "" : "\n") + ReportLine(report);
     return text;
 }
 

@@ -81,7 +81,7 @@ private:
     void ConnectBar(QWidget* child);
     void Click(const std::string& child);
     void ShowNotes();
-    std::string TakeNotes();
+    std::string Notes() const;
 
     const CLeftKeys& m_kKeys;
     CGaitConvertContent* m_pkLogic = nullptr;

@@ -58,7 +58,9 @@ std::optional<std::string> AskFile(QWidget* owner, const CFileDialogSetup& setup
 EAnswer CContent::ShowMessageBox(int, const std::string& text, EButtons buttons)
 {
     const CArrowCursor arrow;
-    return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, TakeNotes());
+    const std::string details = Notes();
+    m_kReports.clear(); // they are shown here
+    return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, details);
 }
 
 std::optional<std::string> CContent::AskOpenFile(const CFileDialogSetup& setup)

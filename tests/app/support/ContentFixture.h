@@ -44,6 +44,7 @@ public:
         if (m_kOnBatchFile)
             m_kOnBatchFile(path);
     }
+    bool IsProgressDue() override { return m_bProgressDue; }
     void BeginWaitCursor() override { ++m_iWaits; }
     void EndWaitCursor() override { --m_iWaits; }
     void PostCloseRequest() override { m_kCalls.emplace_back("close"); }
@@ -94,6 +95,7 @@ public:
     int m_iPlayFace = 0;
     int m_iScrollValue = 0;
     bool m_bButtonState = false;
+    bool m_bProgressDue = false;
 };
 
 /// Settings in memory, folders in one temporary folder: data/ and docs/.
