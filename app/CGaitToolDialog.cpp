@@ -5,6 +5,7 @@
 #include "CRetargeter.h"
 #include "CWaitCursor.h"
 #include "FindBone.h"
+#include "Paths.h"
 #include "SourceTiming.h"
 #include "ToolStatus.h"
 
@@ -150,6 +151,11 @@ void CGaitToolDialog::AskTarget()
 {
     if (const auto path = m_kWindow.AskOpenFile(kOpenMotion))
         LoadTarget(*path);
+}
+
+bool CGaitToolDialog::TakesFile(const std::string& path)
+{
+    return HasExtension(path, ".bvh") || HasExtension(path, ".htr");
 }
 
 bool CGaitToolDialog::DropFile(EToolMotion motion, const std::string& path)

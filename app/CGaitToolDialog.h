@@ -76,6 +76,8 @@ public:
     void SelectLine(int index);
     void SelectSourceItem(int item) { m_kSourceTree.Select(item); }
     void SelectTargetItem(int item) { m_kTargetTree.Select(item); }
+    /// Whether a file may be dropped at all, by its extension.
+    static bool TakesFile(const std::string& path);
     /// A file was dropped on the view of a motion: loads it there. False for the result, which is no file's.
     bool DropFile(EToolMotion motion, const std::string& path);
     /// One tick of the clock for all three views; whether any of them still plays.

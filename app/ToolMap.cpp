@@ -55,7 +55,7 @@ void CGaitToolDialog::AddToMap()
     const std::string& target = m_kTargetTree.SelectedText();
     m_kStatus.clear();
     if (source.empty() || target.empty())
-        m_kStatus = "select a bone in both trees first";
+        m_kStatus = "Select a bone in both trees first";
     else
         m_kMap.Add(source, target);
     MarkBones();

@@ -66,21 +66,21 @@ std::string NotSavedWords(const std::string& path, const CFailure& failure)
     const auto* const found = std::ranges::find(kSaveWords, failure.reason, &SaveWords::m_eReason);
     const std::string why =
         found == std::end(kSaveWords) ? MakeReport(path, failure, false).words : std::string(found->m_kWords);
-    return "not saved: " + Printable(FileName(path)) + ": " + why;
+    return "Not saved: " + Printable(FileName(path)) + ": " + why;
 }
 
 std::string ConvertedWords(const CMotionFile& result, const CFailureRecord& record)
 {
     if (record.Failure())
-        return "not converted: " + MakeReport({}, record.Failure(), false).words;
-    const std::string words = "converted " + FrameCount(result);
+        return "Not converted: " + MakeReport({}, record.Failure(), false).words;
+    const std::string words = "Converted " + FrameCount(result);
     return record.Warnings().empty() ? words
                                      : words + "; " + MakeReport({}, record.Warnings().front(), true).words;
 }
 
 std::string SavedWords(const std::string& path)
 {
-    return "saved " + Printable(FileName(path));
+    return "Saved " + Printable(FileName(path));
 }
 
 std::string MapWords(const std::string& path, size_t lineCount, size_t leftOut)

@@ -57,7 +57,7 @@ protected:
 
     void Click(int id, const std::string& file = {})
     {
-        m_kWindow.m_kAnswer = file.empty() ? std::nullopt : std::optional(m_kFolder.Path(file));
+        m_kToolWindow.m_kAnswer = file.empty() ? std::nullopt : std::optional(m_kFolder.Path(file));
         m_kTool.ClickButton(id);
     }
     /// Loads a walk of some frames.
@@ -111,9 +111,9 @@ protected:
     /// Where a bone of the result stands in a frame.
     Mat4 ResultAt(const char* name, int frame)
     {
-        m_kWindow.View(EToolMotion::Result).SeekStart();
+        m_kToolWindow.View(EToolMotion::Result).SeekStart();
         for (int step = 0; step < frame; ++step)
-            m_kWindow.View(EToolMotion::Result).StepForward();
+            m_kToolWindow.View(EToolMotion::Result).StepForward();
         return Bone(EToolMotion::Result, name)->m_kWorldMatrix;
     }
 
@@ -129,8 +129,8 @@ protected:
         return poses;
     }
 
-    CScriptedToolWindow m_kWindow;
-    CGaitToolDialog m_kTool{m_kWindow, m_kPlatform};
+    CScriptedToolWindow m_kToolWindow;
+    CGaitToolDialog m_kTool{m_kToolWindow, m_kPlatform};
 
 private:
     static std::string MarkedOf(const CBoneTree& tree)
@@ -154,12 +154,12 @@ const std::string kMap =
 TEST_F(ToolTest, ASourceBringsTheFixedSkeletonAlong)
 {
     LoadSource();
-    EXPECT_EQ(m_kWindow.m_kAsked.filter, "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||");
-    EXPECT_EQ(m_kWindow.m_kAsked.defaultExtension, "htr");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.defaultExtension, "htr");
     EXPECT_EQ(m_kTool.SourceTree().Items().size(), 7u);
     EXPECT_EQ(m_kTool.TargetTree().Items().front().m_kText, "LowerTorso");
     for (const EToolMotion motion : kToolMotions)
-        EXPECT_EQ(m_kWindow.View(motion).m_spkShown, m_kTool.Motion(motion).motionRoot);
+        EXPECT_EQ(m_kToolWindow.View(motion).m_spkShown, m_kTool.Motion(motion).motionRoot);
     EXPECT_NE(Bone(EToolMotion::Target, "LFoot"), Bone(EToolMotion::Result, "LFoot")) << "two trees";
     EXPECT_EQ(m_kTool.LastFrameOf(EToolMotion::Source), 2);
     EXPECT_EQ(m_kTool.Status(), "walk.bvh: 3 frames");
@@ -213,7 +213,7 @@ TEST_F(ToolTest, ButtonsTakeClicksWhenTheyCanDoSomething)
     m_kTool.SelectLine(0);
     EXPECT_TRUE(m_kTool.IsEnabled(kToolDetail));
     Click(kToolClose);
-    EXPECT_TRUE(m_kWindow.m_bClosed);
+    EXPECT_TRUE(m_kToolWindow.m_bClosed);
 }
 
 TEST_F(ToolTest, AddedLinesStandBehindTheHead)
@@ -246,7 +246,7 @@ TEST_F(ToolTest, LoadedLinesStandAsTheyWereButForUnknownBones)
     EXPECT_EQ(m_kTool.Map().FrameRate(), 24);
     EXPECT_EQ(Marked(), " hip > LowerTorso ") << "markers of the lines before are gone";
     EXPECT_EQ(m_kTool.Status(), "map.txt: 6 lines; 2 mappings without a bone here left out");
-    EXPECT_EQ(m_kWindow.m_kAsked.filter, "Map Files |*.prf;|Nap Files |*.txt;||");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.prf;|Nap Files |*.txt;||");
 
     LoadMap("hip <---> LowerTorso .|Position 4,5,6|");
     EXPECT_EQ(Lines(), std::string(kHead) + "hip <---> LowerTorso .|Position 4,5,6|");
@@ -271,11 +271,11 @@ TEST_F(ToolTest, AMapComesBackAsItWasSaved)
     LoadSource();
     LoadMap(kMap);
     Click(kToolSaveMap, "saved.txt");
-    EXPECT_EQ(m_kWindow.m_kAsked.defaultExtension, "txt");
-    EXPECT_EQ(m_kWindow.m_kAsked.filter, "Map Files |*.txt;||");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.defaultExtension, "txt");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.txt;||");
     EXPECT_EQ(Read("saved.txt"), Read("map.txt"));
     Click(kToolSaveMap, "none/saved.txt");
-    EXPECT_EQ(m_kTool.Status().find("not saved: saved.txt: "), 0u) << m_kTool.Status();
+    EXPECT_EQ(m_kTool.Status().find("Not saved: saved.txt: "), 0u) << m_kTool.Status();
 }
 
 TEST_F(ToolTest, DeletingKeepsTheSelectionOnTheLinesThatFollow)
@@ -335,11 +335,11 @@ TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
     {
         SCOPED_TRACE(row.what);
         m_kTool.SelectLine(row.line);
-        m_kWindow.m_kOnEdit = nullptr;
+        m_kToolWindow.m_kOnEdit = nullptr;
         const std::string before = m_kTool.Map().SelectedLine()->text;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().SelectedLine()->text, before) << "cancelled";
-        m_kWindow.m_kOnEdit = row.edit;
+        m_kToolWindow.m_kOnEdit = row.edit;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(row.line)].text, row.text);
         EXPECT_EQ(m_kTool.Map().Selected(), row.line);
@@ -380,9 +380,10 @@ TEST_F(ToolTest, AConversionMovesTheResultAsTheLinesSay)
     Click(kToolConvert);
     EXPECT_FALSE(m_kTool.IsPlaying()) << "all views stand";
     EXPECT_TRUE(m_kTool.IsConverted());
-    EXPECT_EQ(m_kTool.Status().find("converted 4 frames"), 0u) << m_kTool.Status();
+    EXPECT_EQ(m_kTool.Status().find("Converted 4 frames"), 0u) << m_kTool.Status();
     EXPECT_EQ(m_kTool.LastFrameOf(EToolMotion::Result), 3);
-    EXPECT_EQ(m_kWindow.View(EToolMotion::Result).m_spkShown, m_kTool.Motion(EToolMotion::Result).motionRoot);
+    EXPECT_EQ(m_kToolWindow.View(EToolMotion::Result).m_spkShown,
+              m_kTool.Motion(EToolMotion::Result).motionRoot);
     EXPECT_NE(ResultAt("LThigh", 0), ResultAt("LThigh", 3));
     const Vec3 path = ResultAt("LowerTorso", 3).Translation() - ResultAt("LowerTorso", 0).Translation();
     EXPECT_GT(path.z, 0.0f) << "the source walks along Z";
@@ -427,7 +428,7 @@ TEST_F(ToolTest, BonesThatAreNotThereHaveNoEffect)
     for (const char* text : {"a <---> LThigh 1,2,3", "hip <---> b 1,2,3", "<---> "})
     {
         m_kTool.SelectLine(line++);
-        m_kWindow.m_kOnEdit = [&](CMapLine& edited) { edited.text = text; };
+        m_kToolWindow.m_kOnEdit = [&](CMapLine& edited) { edited.text = text; };
         Click(kToolDetail);
     }
     EXPECT_EQ(Lines(), "Position 0,0,0|hip <---> LowerTorso .|a <---> LThigh 1,2,3|hip <---> b 1,2,3|<---> |"
@@ -495,8 +496,8 @@ TEST_F(ToolTest, TheResultIsSavedAtItsFixedScale)
     LoadMap(kMap);
     Click(kToolConvert);
     Click(kToolSaveResult, "out.htr");
-    EXPECT_EQ(m_kWindow.m_kAsked.filter, "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||");
-    EXPECT_EQ(m_kTool.Status(), "saved out.htr");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||");
+    EXPECT_EQ(m_kTool.Status(), "Saved out.htr");
     EXPECT_NE(Read("out.htr").find("NumFrames 2\n"), std::string::npos) << "one frame of sixty";
 
     const struct
@@ -505,9 +506,9 @@ TEST_F(ToolTest, TheResultIsSavedAtItsFixedScale)
         const char* path;
         const char* says;
     } refused[] = {
-        {"data/base.htr", "out.bvh",      "not saved: out.bvh: results are written as .htr only"},
-        {"data/base.htr", "none/out.htr", "not saved: out.htr: the file cannot be written"      },
-        {"walk.bvh",      "new.htr",      "not saved: new.htr: the target has no rest pose"     },
+        {"data/base.htr", "out.bvh",      "Not saved: out.bvh: results are written as .htr only"},
+        {"data/base.htr", "none/out.htr", "Not saved: out.htr: the file cannot be written"      },
+        {"walk.bvh",      "new.htr",      "Not saved: new.htr: the target has no rest pose"     },
     };
     for (const auto& row : refused)
     {
@@ -557,7 +558,7 @@ TEST_F(ToolTest, HostileMaps)
         SCOPED_TRACE(row.what);
         Write("hostile.txt", row.bytes);
         Click(kToolLoadMap, "hostile.txt");
-        m_kWindow.m_kOnEdit = [](CMapLine&) {};
+        m_kToolWindow.m_kOnEdit = [](CMapLine&) {};
         for (int line = 0; line < 5; ++line)
         {
             m_kTool.SelectLine(line);

@@ -1,0 +1,80 @@
+#pragma once
+
+#include "CGaitToolDialog.h"
+
+#include <QDialog>
+#include <QStringListModel>
+#include <QTimer>
+#include <array>
+#include <vector>
+
+class QGridLayout;
+class QLabel;
+class QListView;
+class QMenu;
+class QPushButton;
+
+namespace gw {
+
+class CBoneTreeView;
+class CLeftKeys;
+class CMotionPanel;
+
+/// The window of the map tool: shows what the tool answers, forwards what the user does.
+class CGaitToolWindow : public QDialog, private CToolWindow
+{
+public:
+    /// Both must outlive the window.
+    CGaitToolWindow(const CPlatform& platform, const CLeftKeys& keys);
+    ~CGaitToolWindow() override;
+
+    const CGaitToolDialog& Tool() const { return m_kTool; }
+
+protected:
+    void contextMenuEvent(QContextMenuEvent* event) override;
+    void keyPressEvent(QKeyEvent* event) override;
+
+private:
+    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
+    bool EditLine(CMapLine& line) override;
+    std::unique_ptr<CMotionView> CreateView(EToolMotion motion) override;
+    void CloseWindow() override { accept(); }
+    void BeginWaitCursor() override;
+    void EndWaitCursor() override;
+
+    // From the top of the window to its bottom, which is the order of the tab key.
+    void MakeMenu();
+    void MakeTop(QGridLayout& grid);
+    void MakePanels(QGridLayout& grid, const CLeftKeys& keys);
+    void MakeTrees(QGridLayout& grid);
+    void MakeLines(QGridLayout& grid);
+    void MakeStatus(QGridLayout& grid);
+    QLayout* MakeButtons(std::initializer_list<int> ids);
+    QPushButton* MakeButton(int id);
+    CMotionPanel& Panel(EToolMotion motion) { return *m_kPanels[static_cast<size_t>(motion)]; }
+
+    /// Hands something to the tool and shows what came of it.
+    template <class F>
+    void Forward(F operation);
+    void Click(int id);
+    void Tick();
+    void Refresh();
+    void ShowFrames();
+    void ShowLines();
+    void ShowAbout();
+
+    std::array<CMotionPanel*, 3> m_kPanels{};
+    CBoneTreeView* m_pkSourceTree = nullptr;
+    CBoneTreeView* m_pkTargetTree = nullptr;
+    QListView* m_pkLines = nullptr;
+    QLabel* m_pkStatus = nullptr;
+    QMenu* m_pkMenu = nullptr;
+    QStringListModel m_kLineTexts;
+    std::vector<QPushButton*> m_kButtons;
+    QTimer m_kClock;
+    bool m_bShowing = false; // what the tool has
+    CGaitToolDialog m_kTool; // last: its views may draw on the panels until it dies
+};
+
+} // namespace gw

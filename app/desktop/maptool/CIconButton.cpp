@@ -1,0 +1,106 @@
+#include "CIconButton.h"
+
+#include <QPaintEvent>
+#include <QPainter>
+#include <QPainterPath>
+#include <QStyleOptionButton>
+
+namespace gw {
+
+namespace {
+
+constexpr QSize kButtonSize(36, 26);
+constexpr qreal kIconSide = 16; // the pictures' own square
+
+// A picture is up to three areas of four corners; a triangle has two corners in one place.
+struct Area
+{
+    qreal m_afCorners[8];
+};
+
+constexpr Area kNothing{};
+constexpr Area kToLeft{
+    {3, 8, 12, 3, 12, 13, 12, 13}
+};
+constexpr Area kToRight{
+    {4, 3, 13, 8, 13, 8, 4, 13}
+};
+constexpr Area kBarLeft{
+    {2, 3, 4, 3, 4, 13, 2, 13}
+};
+constexpr Area kBarRight{
+    {13, 3, 15, 3, 15, 13, 13, 13}
+};
+constexpr Area kLeftOfBar{
+    {4, 8, 13, 3, 13, 13, 13, 13}
+};
+constexpr Area kRightOfBar{
+    {5, 3, 14, 8, 14, 8, 5, 13}
+};
+constexpr Area kSquare{
+    {4, 4, 12, 4, 12, 12, 4, 12}
+};
+constexpr Area kLineTop{
+    {2, 3, 14, 3, 14, 5, 2, 5}
+};
+constexpr Area kLineMiddle{
+    {2, 7, 14, 7, 14, 9, 2, 9}
+};
+constexpr Area kLineBottom{
+    {2, 11, 14, 11, 14, 13, 2, 13}
+};
+
+// By EButtonIcon.
+constexpr Area kPictures[][3] = {
+    {kBarLeft, kLeftOfBar,  kNothing   }, // the first frame
+    {kToLeft,  kBarRight,   kNothing   }, // a frame back
+    {kSquare,  kNothing,    kNothing   }, // stop
+    {kToRight, kNothing,    kNothing   }, // play
+    {kBarLeft, kRightOfBar, kNothing   }, // a frame on
+    {kLineTop, kLineMiddle, kLineBottom}, // menu
+};
+
+QPainterPath PathOf(EButtonIcon icon)
+{
+    QPainterPath path;
+    for (const Area& area : kPictures[static_cast<size_t>(icon)])
+    {
+        const auto& at = area.m_afCorners;
+        path.addPolygon(QPolygonF({
+            {at[0], at[1]},
+            {at[2], at[3]},
+            {at[4], at[5]},
+            {at[6], at[7]}
+        }));
+        path.closeSubpath();
+    }
+    return path;
+}
+
+} // namespace
+
+CIconButton::CIconButton(EButtonIcon icon, const QString& name, QWidget* parent)
+    : QPushButton(parent), m_eIcon(icon)
+{
+    setAccessibleName(name);
+    setToolTip(name);
+    setAutoDefault(false);
+    setProperty("kind", QStringLiteral("button")); // no room for a text
+}
+
+QSize CIconButton::sizeHint() const
+{
+    return kButtonSize;
+}
+
+void CIconButton::paintEvent(QPaintEvent* event)
+{
+    QPushButton::paintEvent(event);
+    QPainter painter(this);
+    painter.setRenderHint(QPainter::Antialiasing);
+    // On whole pixels, so that bars have sharp edges.
+    painter.translate(QPoint(qRound((width() - kIconSide) / 2), qRound((height() - kIconSide) / 2)));
+    painter.fillPath(PathOf(m_eIcon), palette().color(QPalette::ButtonText));
+}
+
+} // namespace gw

@@ -1,0 +1,166 @@
+#include "CMotionPanel.h"
+
+#include "CGaitToolDialog.h"
+#include "CIconButton.h"
+#include "CPreviewWidget.h"
+#include "QtText.h"
+
+#include <QCoreApplication>
+#include <QDragEnterEvent>
+#include <QDropEvent>
+#include <QHBoxLayout>
+#include <QLabel>
+#include <QMimeData>
+#include <QUrl>
+#include <QVBoxLayout>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kContext = "GaitTool";
+constexpr int kPictureSide = 200;
+constexpr int kGap = 6;
+
+// By EToolMotion.
+constexpr const char* kCaptions[] = {
+    QT_TRANSLATE_NOOP("GaitTool", "Source"),
+    QT_TRANSLATE_NOOP("GaitTool", "Target"),
+    QT_TRANSLATE_NOOP("GaitTool", "Result"),
+};
+
+struct TransportButton
+{
+    EButtonIcon m_eIcon;
+    const char* m_pcName;
+};
+
+// In the order of ETransport.
+constexpr TransportButton kTransportButtons[] = {
+    {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "To the first frame")},
+    {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "One frame back")    },
+    {EButtonIcon::Stop,        QT_TRANSLATE_NOOP("GaitTool", "Stop")              },
+    {EButtonIcon::Play,        QT_TRANSLATE_NOOP("GaitTool", "Play")              },
+    {EButtonIcon::StepForward, QT_TRANSLATE_NOOP("GaitTool", "One frame on")      },
+};
+
+QString CaptionOf(EToolMotion motion)
+{
+    return QCoreApplication::translate(kContext, kCaptions[static_cast<size_t>(motion)]);
+}
+
+// The first motion file among what is dragged; empty when there is none.
+QString MotionFileOf(const QMimeData& mime)
+{
+    for (const QUrl& url : mime.urls())
+    {
+        const QString path = url.toLocalFile();
+        if (CGaitToolDialog::TakesFile(ToUtf8(path)))
+            return path;
+    }
+    return {};
+}
+
+} // namespace
+
+CMotionPanel::CMotionPanel(EToolMotion motion, const CLeftKeys& keys, QWidget* parent)
+    : QWidget(parent), m_eMotion(motion)
+{
+    setObjectName(QStringLiteral("panel%1").arg(static_cast<int>(motion)));
+    setAccessibleName(CaptionOf(motion));
+    auto* const layout = new QVBoxLayout(this);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(kGap);
+    layout->addWidget(MakeCaption());
+    layout->addWidget(MakePicture(keys), 1);
+    layout->addWidget(MakeTransport());
+}
+
+QWidget* CMotionPanel::MakeCaption()
+{
+    auto* const row = new QWidget(this);
+    auto* const caption = new QLabel(CaptionOf(m_eMotion), row);
+    caption->setObjectName(objectName() + QStringLiteral("Caption"));
+    caption->setProperty("kind", QStringLiteral("text"));
+    m_pkFrame = new QLabel(row);
+    m_pkFrame->setObjectName(objectName() + QStringLiteral("Frame"));
+    m_pkFrame->setProperty("kind", QStringLiteral("value"));
+    auto* const layout = new QHBoxLayout(row);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->addWidget(caption);
+    layout->addStretch();
+    layout->addWidget(m_pkFrame);
+    return row;
+}
+
+QWidget* CMotionPanel::MakePicture(const CLeftKeys& keys)
+{
+    QWidget* picture = nullptr;
+    if (HasOpenGL())
+        picture = m_pkPreview = new CPreviewWidget(keys, this);
+    else
+    {
+        auto* const label =
+            new QLabel(QCoreApplication::translate(kContext, "OpenGL is missing: no preview"), this);
+        label->setAlignment(Qt::AlignCenter);
+        label->setProperty("kind", QStringLiteral("view"));
+        picture = label;
+    }
+    picture->setObjectName(objectName() + QStringLiteral("View"));
+    picture->setAccessibleName(CaptionOf(m_eMotion));
+    picture->setMinimumSize(kPictureSide, kPictureSide);
+    picture->setSizePolicy(QSizePolicy::Expanding, QSizePolicy::Expanding);
+    return picture;
+}
+
+QWidget* CMotionPanel::MakeTransport()
+{
+    auto* const row = new QWidget(this);
+    auto* const layout = new QHBoxLayout(row);
+    layout->setContentsMargins(0, 0, 0, 0);
+    layout->setSpacing(kGap);
+    layout->addStretch();
+    const int* id = kTransportIds[static_cast<size_t>(m_eMotion)];
+    for (const auto& [icon, name] : kTransportButtons)
+    {
+        auto* const button = new CIconButton(icon, QCoreApplication::translate(kContext, name), row);
+        button->setObjectName(QString::number(*id));
+        connect(button, &QPushButton::clicked, this, [this, id = *id] { m_kClicked(id); });
+        layout->addWidget(button);
+        ++id;
+    }
+    layout->addStretch();
+    return row;
+}
+
+std::unique_ptr<CMotionView> CMotionPanel::MakeView()
+{
+    if (m_pkPreview)
+        return m_pkPreview->MakeView();
+    return std::make_unique<CGLView>();
+}
+
+void CMotionPanel::ShowFrame(int frame, int lastFrame)
+{
+    m_pkFrame->setText(QCoreApplication::translate(kContext, "frame %1 of %2").arg(frame).arg(lastFrame));
+}
+
+void CMotionPanel::SetDropped(std::function<void(const QString&)> dropped)
+{
+    m_kDropped = std::move(dropped);
+    setAcceptDrops(true);
+}
+
+void CMotionPanel::dragEnterEvent(QDragEnterEvent* event)
+{
+    if (!MotionFileOf(*event->mimeData()).isEmpty())
+        event->acceptProposedAction();
+}
+
+void CMotionPanel::dropEvent(QDropEvent* event)
+{
+    event->acceptProposedAction();
+    m_kDropped(MotionFileOf(*event->mimeData()));
+}
+
+} // namespace gw

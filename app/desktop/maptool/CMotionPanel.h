@@ -1,0 +1,48 @@
+#pragma once
+
+#include "CToolWindow.h"
+
+#include <QWidget>
+#include <functional>
+#include <memory>
+
+class QLabel;
+
+namespace gw {
+
+class CLeftKeys;
+class CPreviewWidget;
+
+/// One of the map tool's three previews: caption, picture, five transport buttons. A motion file may be
+/// dropped on it.
+class CMotionPanel : public QWidget
+{
+public:
+    /// The keys must outlive the panel.
+    CMotionPanel(EToolMotion motion, const CLeftKeys& keys, QWidget* parent);
+
+    /// A new view that is drawn here; where there is no GL, one that is not drawn.
+    std::unique_ptr<CMotionView> MakeView();
+    void ShowFrame(int frame, int lastFrame);
+    /// Called with the id of a transport button.
+    void SetClicked(std::function<void(int id)> clicked) { m_kClicked = std::move(clicked); }
+    /// Called with a dropped motion file. Without this, nothing may be dropped.
+    void SetDropped(std::function<void(const QString& path)> dropped);
+
+protected:
+    void dragEnterEvent(QDragEnterEvent* event) override;
+    void dropEvent(QDropEvent* event) override;
+
+private:
+    QWidget* MakeCaption();
+    QWidget* MakePicture(const CLeftKeys& keys);
+    QWidget* MakeTransport();
+
+    EToolMotion m_eMotion;
+    QLabel* m_pkFrame = nullptr;
+    CPreviewWidget* m_pkPreview = nullptr;
+    std::function<void(int)> m_kClicked;
+    std::function<void(const QString&)> m_kDropped;
+};
+
+} // namespace gw

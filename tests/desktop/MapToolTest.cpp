@@ -1,0 +1,300 @@
+// Stories of a person at the map tool's window.
+
+#include "CGaitToolWindow.h"
+#include "CLeftKeys.h"
+#include "CPreviewWidget.h"
+#include "ContentFixture.h"
+#include "QtText.h"
+
+#include <QApplication>
+#include <QDragEnterEvent>
+#include <QLabel>
+#include <QLineEdit>
+#include <QListView>
+#include <QMenu>
+#include <QMimeData>
+#include <QPushButton>
+#include <QSpinBox>
+#include <QTest>
+#include <QTimer>
+#include <QTreeWidget>
+#include <QUrl>
+
+namespace gw {
+
+namespace {
+
+class MapToolTest : public ContentTest
+{
+protected:
+    MapToolTest()
+    {
+        Write("walk.bvh", BvhText(kPoserBones, 8));
+        Write("map.txt",
+              "Walk\nPosition 0,0,0\nFrameRate 60\nhip <---> LowerTorso .\nlThigh <---> LThigh 1,2,3\n");
+        m_kTool.show();
+        m_kTool.activateWindow();
+        EXPECT_TRUE(QTest::qWaitForWindowActive(&m_kTool));
+    }
+
+    template <class T>
+    T* Child(const char* name) const
+    {
+        auto* const child = m_kTool.findChild<T*>(QString::fromLatin1(name));
+        EXPECT_NE(child, nullptr) << name;
+        return child;
+    }
+    void Click(const char* button) const { QTest::mouseClick(Child<QPushButton>(button), Qt::LeftButton); }
+    /// Clicks a button and does something in the dialog that it opens.
+    template <class F>
+    void ClickAnd(const char* button, F answer) const
+    {
+        bool wasThere = false;
+        QTimer::singleShot(0, [&] {
+            auto* const dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+            wasThere = dialog != nullptr;
+            if (dialog)
+                answer(*dialog);
+        });
+        Click(button);
+        EXPECT_TRUE(wasThere) << button;
+    }
+    /// Clicks a button and gives its file dialog a file of the temporary folder.
+    void ClickFile(const char* button, const std::string& file) const
+    {
+        ClickAnd(button, [&](QDialog& dialog) {
+            dialog.findChild<QLineEdit*>(QStringLiteral("fileNameEdit"))
+                ->setText(ToQString(m_kFolder.Path(file)));
+            dialog.accept();
+        });
+    }
+    void LoadSourceAndMap() const
+    {
+        ClickFile("1000", "walk.bvh");
+        ClickFile("1012", "map.txt");
+    }
+    QString Line(int row) const { return Child<QListView>("1008")->model()->index(row, 0).data().toString(); }
+    void SelectLine(int row) const
+    {
+        auto* const list = Child<QListView>("1008");
+        const QModelIndex line = list->model()->index(row, 0);
+        list->scrollTo(line);
+        QTest::mouseClick(list->viewport(), Qt::LeftButton, {}, list->visualRect(line).center());
+    }
+    void SelectBone(const char* tree, const char* bone) const
+    {
+        auto* const view = Child<QTreeWidget>(tree);
+        const auto found = view->findItems(QString::fromLatin1(bone), Qt::MatchExactly | Qt::MatchRecursive);
+        ASSERT_FALSE(found.isEmpty()) << bone;
+        QTest::mouseClick(view->viewport(), Qt::LeftButton, {}, view->visualItemRect(found.first()).center());
+    }
+    QString SelectedBone(const char* tree) const
+    {
+        const auto* const item = Child<QTreeWidget>(tree)->currentItem();
+        return item ? item->text(0) : QString();
+    }
+    QString Status() const { return Child<QLabel>("status")->text(); }
+
+    CLeftKeys m_kKeys;
+    CGaitToolWindow m_kTool{m_kPlatform, m_kKeys};
+};
+
+void Press(const QDialog& dialog, const char* text)
+{
+    for (QPushButton* button : dialog.findChildren<QPushButton*>())
+    {
+        if (button->text().remove(u'&') == QLatin1String(text))
+            button->click();
+    }
+}
+
+} // namespace
+
+TEST_F(MapToolTest, FromASourceToASavedResult)
+{
+    EXPECT_FALSE(Child<QPushButton>("1014")->isEnabled());
+    LoadSourceAndMap();
+    EXPECT_EQ(Status(), QStringLiteral("map.txt: 5 lines"));
+    EXPECT_EQ(Line(3), QStringLiteral("hip <---> LowerTorso ."));
+    Click("1014");
+    EXPECT_EQ(Child<QLabel>("panel2Frame")->text(), QStringLiteral("frame 0 of 7"));
+
+    const auto picture = [this] {
+        return HasOpenGL() ? Child<CPreviewWidget>("panel2View")->grabFramebuffer() : QImage();
+    };
+    const QImage first = picture();
+    Click("1030");
+    EXPECT_EQ(Child<QLabel>("panel2Frame")->text(), QStringLiteral("frame 1 of 7"));
+    EXPECT_TRUE(first.isNull() || picture() != first);
+
+    QStringList frames;
+    Click("1029");
+    while (m_kTool.Tool().IsPlaying())
+    {
+        QTest::qWait(5);
+        frames << Child<QLabel>("panel2Frame")->text();
+    }
+    frames.removeDuplicates();
+    EXPECT_GT(frames.size(), 3) << "the clock moved it";
+    EXPECT_EQ(frames.last(), QStringLiteral("frame 0 of 7")) << "once, and back to the beginning";
+
+    ClickFile("1016", "out");
+    EXPECT_TRUE(Exists("out.htr")) << "with the extension that was left out";
+    ClickFile("1013", "saved");
+    EXPECT_EQ(Read("saved.txt"), Read("map.txt"));
+}
+
+TEST_F(MapToolTest, APairOfBonesBecomesALine)
+{
+    ClickFile("1000", "walk.bvh");
+    SelectBone("sourceTree", "rThigh");
+    SelectBone("targetTree", "RThigh");
+    Click("1006");
+    EXPECT_EQ(Line(3), QStringLiteral("rThigh <---> RThigh ."));
+    SelectLine(3);
+    SelectBone("sourceTree", "hip");
+    SelectBone("targetTree", "LowerTorso");
+    Click("1006");
+    EXPECT_EQ(Line(4), QStringLiteral("hip <---> LowerTorso ."));
+    EXPECT_EQ(SelectedBone("sourceTree"), QStringLiteral("hip")) << "the trees stay where the user put them";
+    SelectLine(3);
+    EXPECT_EQ(SelectedBone("sourceTree") + SelectedBone("targetTree"), QStringLiteral("rThighRThigh"));
+    QTest::keyClick(Child<QListView>("1008"), Qt::Key_Delete);
+    EXPECT_EQ(Line(3), QStringLiteral("hip <---> LowerTorso ."));
+}
+
+TEST_F(MapToolTest, EachKindOfLineHasItsDialog)
+{
+    const struct
+    {
+        int line;
+        const char* dialog;
+        const char* text;
+    } rows[] = {
+        {0, "161", "Walking"                    },
+        {1, "159", "Position 0,-70,0"           },
+        {2, "160", "FrameRate -70"              },
+        {4, "158", "lThigh <---> LThigh 1,-70,3"},
+    };
+    LoadSourceAndMap();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.dialog);
+        const QString before = Line(row.line);
+        const auto change = [&](QDialog& dialog, const char* button) {
+            EXPECT_EQ(dialog.objectName(), QLatin1String(row.dialog));
+            const auto numbers = dialog.findChildren<QSpinBox*>();
+            if (numbers.isEmpty())
+                dialog.findChild<QLineEdit*>(QStringLiteral("text"))->setText(QLatin1String(row.text));
+            else
+                numbers[numbers.size() / 2]->setValue(-70);
+            Press(dialog, button);
+        };
+        SelectLine(row.line);
+        ClickAnd("1033", [&](QDialog& dialog) { change(dialog, "Cancel"); });
+        EXPECT_EQ(Line(row.line), before);
+        ClickAnd("1033", [&](QDialog& dialog) { change(dialog, "OK"); });
+        EXPECT_EQ(Line(row.line), QLatin1String(row.text));
+        EXPECT_EQ(Child<QListView>("1008")->currentIndex().row(), row.line);
+    }
+}
+
+TEST_F(MapToolTest, AMotionDroppedOnAPreviewIsLoadedThere)
+{
+    const auto drop = [this](const char* panel, const std::string& file) {
+        QMimeData mime;
+        mime.setUrls({QUrl::fromLocalFile(ToQString(m_kFolder.Path(file)))});
+        QWidget* const view = Child<QWidget>(panel)->findChildren<CPreviewWidget*>().value(0, nullptr);
+        QWidget* const under = view ? view : Child<QWidget>(panel);
+        QDragEnterEvent enter({5, 5}, Qt::CopyAction, &mime, Qt::LeftButton, {});
+        enter.ignore();
+        QApplication::sendEvent(under, &enter);
+        if (!enter.isAccepted())
+            return false;
+        QDropEvent dropped({5, 5}, Qt::CopyAction, &mime, Qt::LeftButton, {});
+        QApplication::sendEvent(Child<QWidget>(panel), &dropped);
+        return true;
+    };
+    EXPECT_TRUE(drop("panel0", "walk.bvh"));
+    EXPECT_EQ(Status(), QStringLiteral("walk.bvh: 8 frames"));
+    EXPECT_EQ(Child<QTreeWidget>("targetTree")->topLevelItem(0)->text(0), QStringLiteral("LowerTorso"));
+    EXPECT_TRUE(drop("panel1", "walk.bvh"));
+    EXPECT_EQ(Child<QTreeWidget>("targetTree")->topLevelItem(0)->text(0), QStringLiteral("hip"));
+    EXPECT_FALSE(drop("panel0", "map.txt"));
+    EXPECT_FALSE(drop("panel2", "walk.bvh")) << "a result is no file's";
+}
+
+TEST_F(MapToolTest, FilesThatAreNoMapOrMotionAreSaidBesideTheWindow)
+{
+    LoadSourceAndMap();
+    const QSize size = m_kTool.size();
+    Write("bad.htr", "x");
+    for (const char* button : {"1000", "1001"})
+    {
+        ClickFile(button, "bad.htr");
+        EXPECT_TRUE(Status().startsWith(QStringLiteral("bad.htr:"))) << ToUtf8(Status());
+    }
+    for (const std::string& bytes :
+         {std::string(100'000, 'x') + '\n' + std::string(100'000, '\0'),
+          std::string("\xff\xfe\x01 <---> \x80\n\n*\n"), std::string(200'000, '\n')})
+    {
+        Write("odd.txt", bytes);
+        ClickFile("1012", "odd.txt");
+        EXPECT_EQ(m_kTool.size(), size) << "no text widens the window";
+        SelectLine(0);
+        ClickAnd("1033", [](QDialog& dialog) { Press(dialog, "Cancel"); });
+        Click("1014");
+    }
+    Click("1011");
+    EXPECT_EQ(Child<QListView>("1008")->model()->rowCount(), 0);
+}
+
+TEST_F(MapToolTest, TheWindowMenuOpensTheAboutBox)
+{
+    Click("menuButton");
+    auto* const menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
+    ASSERT_NE(menu, nullptr);
+    const QList<QAction*> entries = menu->actions();
+    ASSERT_EQ(entries.size(), 3);
+    EXPECT_TRUE(entries[1]->isSeparator());
+    EXPECT_EQ(entries[2]->text(), QStringLiteral("About GaitTool(&A)..."));
+    QStringList words;
+    QTimer::singleShot(0, [&] {
+        const auto* const box = qobject_cast<QDialog*>(QApplication::activeModalWidget());
+        ASSERT_NE(box, nullptr);
+        for (const QLabel* label : box->findChildren<QLabel*>())
+            words << label->text();
+        Press(*box, "OK");
+    });
+    QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(entries[2]).center());
+    EXPECT_EQ(words, (QStringList{QStringLiteral("GaitTool"), QStringLiteral("Gaitwright v2.0")}));
+    QTest::keyClick(&m_kTool, Qt::Key_Escape);
+    EXPECT_TRUE(m_kTool.isVisible()) << "the Escape key loses no map";
+    Click("1");
+    EXPECT_FALSE(m_kTool.isVisible());
+}
+
+// At the smallest size that the window takes.
+TEST_F(MapToolTest, EverythingIsNamedAndNothingIsCut)
+{
+    LoadSourceAndMap();
+    m_kTool.resize(m_kTool.minimumSizeHint());
+    QTest::qWait(0);
+    for (const QPushButton* button : m_kTool.findChildren<QPushButton*>())
+    {
+        SCOPED_TRACE(ToUtf8(button->objectName()));
+        EXPECT_FALSE(button->objectName().isEmpty());
+        EXPECT_FALSE(button->accessibleName().isEmpty());
+        EXPECT_GE(button->width(), button->minimumSizeHint().width());
+        EXPECT_GE(button->height(), button->minimumSizeHint().height());
+        EXPECT_TRUE(m_kTool.rect().contains(
+            button->mapTo(&m_kTool, QPoint(button->width(), button->height()) - QPoint(1, 1))));
+    }
+    for (const QLabel* label : m_kTool.findChildren<QLabel*>())
+    {
+        if (!label->wordWrap())
+            EXPECT_GE(label->width(), label->sizeHint().width()) << ToUtf8(label->text());
+    }
+}
+
+} // namespace gw
