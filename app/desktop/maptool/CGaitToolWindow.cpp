@@ -158,12 +158,12 @@ void CGaitToolWindow::MakeTrees(QGridLayout& grid)
     m_pkSourceTree = new CBoneTreeView(this);
     m_pkSourceTree->setObjectName(QStringLiteral("sourceTree"));
     m_pkSourceTree->setAccessibleName(Translated("Source bones"));
-    m_pkSourceTree->SetSelected([this](int item) { Forward([&] { m_kTool.SelectSourceItem(item); }); });
+    m_pkSourceTree->SetOnSelect([this](int item) { Forward([&] { m_kTool.SelectSourceItem(item); }); });
     grid.addWidget(m_pkSourceTree, kTreeRow, 0);
     m_pkTargetTree = new CBoneTreeView(this);
     m_pkTargetTree->setObjectName(QStringLiteral("targetTree"));
     m_pkTargetTree->setAccessibleName(Translated("Target bones"));
-    m_pkTargetTree->SetSelected([this](int item) { Forward([&] { m_kTool.SelectTargetItem(item); }); });
+    m_pkTargetTree->SetOnSelect([this](int item) { Forward([&] { m_kTool.SelectTargetItem(item); }); });
     grid.addWidget(m_pkTargetTree, kTreeRow, 1);
     grid.addLayout(MakeButtons({kToolAddToMap}), kEditRow, 0, 1, 2);
 }
@@ -323,8 +323,8 @@ void CGaitToolWindow::Refresh()
 {
     for (QPushButton* button : m_kButtons)
         button->setEnabled(m_kTool.IsEnabled(button->objectName().toInt()));
-    m_pkSourceTree->Show(m_kTool.SourceTree());
-    m_pkTargetTree->Show(m_kTool.TargetTree());
+    m_pkSourceTree->ShowTree(m_kTool.SourceTree(), {});
+    m_pkTargetTree->ShowTree(m_kTool.TargetTree(), {});
     ShowLines();
     ShowFrames();
     m_pkStatus->setText(ToQString(m_kTool.Status()));

@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// One of the editor's two bone trees on the screen. Knows what it shows, so that a tree that only changed
+/// A tree of bones on the screen. Knows what it shows, so that a tree that only changed
 /// its markers or its selection is not built again: scroll position and folded bones stay.
 class CBoneTreeView : public QTreeWidget
 {
