@@ -1,5 +1,6 @@
 #include "CMessageBox.h"
 
+#include "DialogParts.h"
 #include "QtText.h"
 
 #include <QBoxLayout>
@@ -54,22 +55,12 @@ std::span<const ButtonRow> RowsOf(EButtons buttons)
 
 constexpr int kIconSide = 36;
 constexpr int kTextWidth = 440;
-constexpr int kButtonWidth = 84;
-constexpr int kMargin = 16;
 constexpr int kLeastWidth = 320;
 constexpr double kMostOfScreen = 0.6; // of its height, for the whole box
 
 QString Own(const char* text)
 {
     return QCoreApplication::translate("CMessageBox", text);
-}
-
-template <class Widget>
-Widget* Named(Widget* widget, const char* name, const QString& accessibleName)
-{
-    widget->setObjectName(QLatin1String(name));
-    widget->setAccessibleName(accessibleName);
-    return widget;
 }
 
 // A ring around a letter, in the colour of the text.
@@ -137,12 +128,12 @@ CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& 
     Named(this, "messageBox", caption);
     setWindowTitle(caption);
     auto* top = new QHBoxLayout;
-    top->setSpacing(kMargin);
+    top->setSpacing(kDialogMargin);
     top->addWidget(MakeIcon(buttons != EButtons::OK), 0, Qt::AlignTop);
     top->addWidget(MakeText(text), 1, Qt::AlignLeft | Qt::AlignVCenter);
     auto* layout = new QVBoxLayout(this);
-    layout->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
-    layout->setSpacing(kMargin);
+    layout->setContentsMargins(kDialogMargin, kDialogMargin, kDialogMargin, kDialogMargin);
+    layout->setSpacing(kDialogMargin);
     layout->setSizeConstraint(QLayout::SetFixedSize); // grows and shrinks with the details
     layout->addLayout(top);
     layout->addStrut(kLeastWidth);
@@ -173,7 +164,7 @@ QWidget* CMessageBox::MakeDetails(const QString& details)
     m_pkDetails->setReadOnly(true);
     m_pkDetails->setTabChangesFocus(true);
     m_pkDetails->setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
-    m_pkDetails->setMinimumWidth(kIconSide + kMargin + kTextWidth);
+    m_pkDetails->setMinimumWidth(kIconSide + kDialogMargin + kTextWidth);
     m_pkDetails->hide();
     return m_pkDetails;
 }
@@ -182,7 +173,7 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
 {
     auto* layout = new QHBoxLayout;
     layout->addStretch();
-    layout->setSpacing(kMargin / 2);
+    layout->setSpacing(kDialogSpacing);
     for (const ButtonRow& row : RowsOf(buttons))
     {
         auto* button =
@@ -224,7 +215,7 @@ void CMessageBox::ShowDetails(bool visible)
 {
     if (visible)
     {
-        const int margins = 2 * kMargin;
+        const int margins = 2 * kDialogMargin;
         const int least = 4 * m_pkDetails->fontMetrics().lineSpacing();
         const int most =
             static_cast<int>(kMostOfScreen * screen()->availableSize().height()) - height() - margins;

@@ -1,0 +1,70 @@
+// What is written into file dialogs: the text of the folder chooser, and filters.
+
+#include "FolderText.h"
+#include "FileFilter.h"
+
+#include <gmock/gmock.h>
+
+namespace gw {
+namespace {
+
+TEST(FolderText, NamesAFolderByBothSeparators)
+{
+    const struct
+    {
+        const char* what;
+        const char* text;
+        const char* folder; // null for none
+    } rows[] = {
+        {"nothing is the open folder",            "",                 "/home/ann/"            },
+        {"the open folder itself",                "/home/ann",        "/home/ann/"            },
+        {"a separator at the end goes and comes", "/takes/",          "/takes/"               },
+        {"the other separator",                   "\\takes\\day 1\\", "/takes/day 1/"         },
+        {"the root",                              "/",                "/"                     },
+        {"a name in the open folder",             "takes/day 1",      "/home/ann/takes/day 1/"},
+        {"two backslashes in a row",              "/takes\\\\day",    nullptr                 },
+        {"two backslashes at the end",            "/takes\\\\",       nullptr                 },
+        {"two slashes in a row",                  "//takes",          nullptr                 },
+        {"one of each",                           "/takes/\\day",     nullptr                 },
+        {"only the two",                          "\\\\",             nullptr                 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const std::optional<std::string> folder = FolderOfText(row.text, "/home/ann");
+        EXPECT_EQ(folder.value_or("none"), row.folder ? row.folder : "none");
+    }
+    EXPECT_EQ(FolderOfText("takes", "/"), "/takes/");
+}
+
+TEST(FolderText, IsShownWithoutItsLastSeparator)
+{
+    EXPECT_EQ(FolderName("/home/ann/"), "/home/ann");
+    EXPECT_EQ(FolderName("/"), "/");
+    EXPECT_EQ(FolderName(""), "");
+}
+
+std::vector<std::string> Told(std::string_view filter)
+{
+    std::vector<std::string> told;
+    for (const CFileFilter& choice : SplitFilter(filter))
+    {
+        told.push_back(choice.text);
+        told.insert(told.end(), choice.patterns.begin(), choice.patterns.end());
+    }
+    return told;
+}
+
+TEST(FileFilter, IsCutIntoTextsAndPatterns)
+{
+    using testing::ElementsAre;
+    EXPECT_THAT(Told("BVH (*.bvh) |*.bvh|ORN|*.orn||"), ElementsAre("BVH (*.bvh) ", "*.bvh", "ORN", "*.orn"));
+    EXPECT_THAT(Told("Motions|*.bvh;*.htr|"), ElementsAre("Motions", "*.bvh", "*.htr"));
+    EXPECT_THAT(Told("Motions|*.bvh"), ElementsAre("Motions", "*.bvh"));
+    EXPECT_THAT(Told("Motions|"), ElementsAre());
+    EXPECT_THAT(Told("||"), ElementsAre());
+    EXPECT_THAT(Told(""), ElementsAre());
+}
+
+} // namespace
+} // namespace gw
