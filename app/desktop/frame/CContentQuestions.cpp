@@ -2,11 +2,13 @@
 
 #include "CContent.h"
 #include "CGaitConvertContent.h"
+#include "CMessageBox.h"
+#include "CSelectFolderDialog.h"
+#include "FileDialog.h"
 #include "QtText.h"
 #include "StringTable.h"
 #include "Stubs.h"
 
-#include <QFileDialog>
 #include <QGuiApplication>
 
 namespace gw {
@@ -23,36 +25,6 @@ public:
     CArrowCursor& operator=(const CArrowCursor&) = delete;
 };
 
-// "text|pattern|" pairs as the toolkit names them: "text (pattern)".
-QStringList NameFilters(const std::string& filter)
-{
-    QStringList names;
-    const QStringList parts = ToQString(filter).split(QLatin1Char('|'));
-    for (qsizetype i = 0; i + 1 < parts.size() && !parts[i].isEmpty(); i += 2)
-    {
-        const QString text = parts[i].left(parts[i].indexOf(QLatin1Char('('))).trimmed();
-        names << text + QStringLiteral(" (") +
-                     QString(parts[i + 1]).replace(QLatin1Char(';'), QLatin1Char(' ')) + QLatin1Char(')');
-    }
-    return names;
-}
-
-std::optional<std::string> AskFile(QWidget* owner, const CFileDialogSetup& setup,
-                                   QFileDialog::AcceptMode mode)
-{
-    const CArrowCursor arrow;
-    QFileDialog dialog(owner);
-    dialog.setAcceptMode(mode);
-    dialog.setFileMode(mode == QFileDialog::AcceptOpen ? QFileDialog::ExistingFile : QFileDialog::AnyFile);
-    dialog.setNameFilters(NameFilters(setup.filter));
-    dialog.setDefaultSuffix(ToQString(setup.defaultExtension));
-    if (!setup.initialFolder.empty())
-        dialog.setDirectory(ToQString(setup.initialFolder));
-    if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty())
-        return std::nullopt;
-    return ToUtf8(dialog.selectedFiles().constFirst());
-}
-
 } // namespace
 
 EAnswer CContent::ShowMessageBox(int, const std::string& text, EButtons buttons)
@@ -65,12 +37,14 @@ EAnswer CContent::ShowMessageBox(int, const std::string& text, EButtons buttons)
 
 std::optional<std::string> CContent::AskOpenFile(const CFileDialogSetup& setup)
 {
-    return AskFile(this, setup, QFileDialog::AcceptOpen);
+    const CArrowCursor arrow;
+    return RunFileDialog(*this, QFileDialog::AcceptOpen, setup);
 }
 
 std::optional<std::string> CContent::AskSaveFile(const CFileDialogSetup& setup)
 {
-    return AskFile(this, setup, QFileDialog::AcceptSave);
+    const CArrowCursor arrow;
+    return RunFileDialog(*this, QFileDialog::AcceptSave, setup);
 }
 
 std::optional<CFolderChoice> CContent::AskFolder(const CFileDialogSetup& setup)

@@ -54,11 +54,7 @@ bool CMessageFilter::eventFilter(QObject* watched, QEvent* event)
     }
     if (!watched->isWidgetType() || !IsLeftPress(*event))
         return false;
-    const auto& press = static_cast<const QMouseEvent&>(*event);
-    if (press.timestamp() == m_uiLastPress && press.timestamp() != 0)
-        return false;
-    m_uiLastPress = press.timestamp();
-    const bool again = IsCornerAgain(press.globalPosition().toPoint());
+    const bool again = IsCornerAgain(static_cast<const QMouseEvent&>(*event).globalPosition().toPoint());
     m_kSinceCorner.invalidate();
     if (!again)
         return false;

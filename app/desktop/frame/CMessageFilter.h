@@ -26,7 +26,6 @@ private:
     std::function<void()> m_kRequestClose;
     QElapsedTimer m_kSinceCorner; ///< invalid where no click is remembered
     QPoint m_kCorner;
-    ulong m_uiLastPress = 0; ///< time stamp: one press goes through several widgets
 };
 
 } // namespace gw

@@ -103,6 +103,7 @@ bool CSkin::ReadFile(const char* name, std::string& text, std::string& problem) 
 bool CSkin::ReadLayout(std::string_view text, std::string& problem)
 {
     m_kChildren.clear();
+    m_kSize = QSize();
     std::string_view line;
     for (int number = 1; NextLine(text, line); ++number)
     {

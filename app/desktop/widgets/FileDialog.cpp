@@ -1,20 +1,27 @@
 #include "FileDialog.h"
 
+#include "FileFilter.h"
 #include "QtText.h"
 
 namespace gw {
 
+namespace {
+
+// The text as it stands, and behind it the patterns in brackets, which the dialog hides.
 QStringList NameFilters(const std::string& filter)
 {
-    const QStringList parts = ToQString(filter).split(u'|', Qt::SkipEmptyParts);
-    QStringList filters;
-    for (qsizetype i = 0; i + 1 < parts.size(); i += 2)
+    QStringList names;
+    for (const CFileFilter& choice : SplitFilter(filter))
     {
-        const QString patterns = parts[i + 1].split(u';', Qt::SkipEmptyParts).join(u' ');
-        filters << parts[i] + u'(' + patterns + u')';
+        QStringList patterns;
+        for (const std::string& pattern : choice.patterns)
+            patterns << ToQString(pattern);
+        names << ToQString(choice.text) + QLatin1Char('(') + patterns.join(QLatin1Char(' ')) + QLatin1Char(')');
     }
-    return filters;
+    return names;
 }
+
+} // namespace
 
 std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode mode,
                                          const CFileDialogSetup& setup)
