@@ -13,8 +13,8 @@ struct CFileFilter
     std::vector<std::string> patterns; ///< "*.bvh"
 };
 
-/// The choices of a filter as CFileDialogSetup has it: pairs of text and patterns, "|" behind each; ";" stands
-/// between the patterns of one choice. An unfinished pair at the end is left out.
+/// The choices of a filter as CFileDialogSetup has it: pairs of text and patterns, "|" behind each; ";"
+/// stands between the patterns of one choice. An unfinished pair at the end is left out.
 std::vector<CFileFilter> SplitFilter(std::string_view filter);
 
 } // namespace gw

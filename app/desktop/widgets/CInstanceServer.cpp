@@ -1,0 +1,124 @@
+#include "CInstanceServer.h"
+
+#include "InstanceMessage.h"
+#include "QtText.h"
+
+#include <QDeadlineTimer>
+#include <QDir>
+#include <QFileInfo>
+#include <QLocalSocket>
+#include <QTimer>
+
+#include <unistd.h>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kWindowClass = "TK_KESTRO_GAIT_CONV_1";
+constexpr qsizetype kLongestSocketPath = 107; // bytes: what the system's address of a socket holds
+constexpr int kClientMilliseconds = 800;
+constexpr int kServerMilliseconds = 2000; // after which a caller who says nothing is sent away
+
+// Whether only the user can put something into a folder.
+bool IsPrivate(const QString& path)
+{
+    const QFileInfo folder(path);
+    constexpr QFile::Permissions kOthers = QFile::WriteGroup | QFile::WriteOther;
+    return folder.isAbsolute() && folder.isDir() && !folder.isSymLink() && folder.ownerId() == geteuid() &&
+           !(folder.permissions() & kOthers);
+}
+
+// A folder with the user's id in its name, made where it is missing.
+QString OwnFolder()
+{
+    const QString path = QDir::tempPath() + QStringLiteral("/gaitwright-") + QString::number(geteuid());
+    QDir().mkdir(path, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
+    return path;
+}
+
+QString SocketIn(const QString& folder)
+{
+    const QString path = folder + QLatin1Char('/') + QLatin1String(kWindowClass);
+    const bool fits = QFile::encodeName(path).size() <= kLongestSocketPath;
+    return fits && IsPrivate(folder) ? path : QString();
+}
+
+} // namespace
+
+QString InstanceSocketPath()
+{
+    const QString path = SocketIn(qEnvironmentVariable("XDG_RUNTIME_DIR"));
+    return path.isEmpty() ? SocketIn(OwnFolder()) : path;
+}
+
+CInstanceServer::CInstanceServer(Raise raise, QObject* parent) : QObject(parent), m_kRaise(std::move(raise))
+{
+    connect(&m_kServer, &QLocalServer::newConnection, this, [this] {
+        while (QLocalSocket* socket = m_kServer.nextPendingConnection())
+            Attend(*socket);
+    });
+    Listen();
+}
+
+// Without socket options: with them the toolkit takes a living owner's name away.
+void CInstanceServer::Listen()
+{
+    const QString path = InstanceSocketPath();
+    if (path.isEmpty() || m_kServer.listen(path))
+        return;
+    QLocalSocket owner;
+    owner.connectToServer(path);
+    const bool isAlive = owner.waitForConnected(kClientMilliseconds);
+    if (isAlive || owner.error() != QLocalSocket::ConnectionRefusedError)
+        return;
+    QLocalServer::removeServer(path);
+    m_kServer.listen(path);
+}
+
+void CInstanceServer::Attend(QLocalSocket& socket)
+{
+    socket.setReadBufferSize(kMessageHead + kLongestPath + 1);
+    connect(&socket, &QLocalSocket::readyRead, this, [this, &socket] { Receive(socket); });
+    connect(&socket, &QLocalSocket::disconnected, &socket, [&socket] { socket.deleteLater(); });
+    QTimer::singleShot(kServerMilliseconds, &socket, [&socket] { socket.abort(); });
+}
+
+void CInstanceServer::Receive(QLocalSocket& socket)
+{
+    std::string path;
+    const EMessage message = ReadMessage(socket.peek(socket.bytesAvailable()), path);
+    if (message == EMessage::Partial)
+        return;
+    socket.disconnect(this);
+    if (message == EMessage::Wrong)
+    {
+        socket.abort();
+        return;
+    }
+    socket.write(&kMessageAnswer, 1);
+    socket.flush();
+    socket.disconnectFromServer();
+    // Later: opening a file may ask something, and the caller is not to wait for that.
+    QMetaObject::invokeMethod(
+        this, [this, path] { m_kRaise(path); }, Qt::QueuedConnection);
+}
+
+bool RaiseFirstInstance(const std::string& path)
+{
+    // The first instance may stand in another folder.
+    const std::string absolute =
+        path.empty() ? path : ToUtf8(QDir::current().absoluteFilePath(ToQString(path)));
+    const QDeadlineTimer deadline(kClientMilliseconds);
+    const auto remaining = [&] { return static_cast<int>(deadline.remainingTime()); };
+    const QString socketPath = InstanceSocketPath();
+    QLocalSocket socket;
+    socket.connectToServer(socketPath);
+    if (socketPath.isEmpty() || !socket.waitForConnected(remaining()))
+        return false;
+    socket.write(MakeMessage(absolute));
+    char answer = 0;
+    return socket.waitForReadyRead(remaining()) && socket.getChar(&answer) && answer == kMessageAnswer;
+}
+
+} // namespace gw
