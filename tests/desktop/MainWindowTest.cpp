@@ -4,6 +4,7 @@
 
 #include <QApplication>
 #include <QMenu>
+#include <QMouseEvent>
 #include <QSlider>
 #include <QTest>
 #include <fstream>
@@ -230,9 +231,10 @@ TEST(MainWindow, ASecondClickOnTheCornerCloses)
     auto* const face = person.Child("face");
     QTest::mousePress(face, Qt::LeftButton, Qt::NoModifier, QPoint(3, 3));
     ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
-    QWidget* const menu = QApplication::activePopupWidget();
-    QTest::mousePress(menu, Qt::LeftButton, Qt::NoModifier,
-                      menu->mapFromGlobal(face->mapToGlobal(QPoint(3, 3))));
+    const QPoint corner = face->mapToGlobal(QPoint(3, 3));
+    QMouseEvent again(QEvent::MouseButtonPress, QPointF(), corner, Qt::LeftButton, Qt::LeftButton,
+                      Qt::NoModifier);
+    QApplication::sendEvent(QApplication::activePopupWidget(), &again);
     EXPECT_TRUE(person.WaitUntil([&] { return !person.Frame().isVisible(); }));
 }
 

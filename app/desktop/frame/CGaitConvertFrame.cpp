@@ -14,10 +14,10 @@
 #include <QApplication>
 #include <QCloseEvent>
 #include <QDragEnterEvent>
-#include <QMimeData>
-#include <QMouseEvent>
 #include <QKeyCombination>
 #include <QKeySequence>
+#include <QMimeData>
+#include <QMouseEvent>
 #include <QScreen>
 #include <QShortcut>
 #include <QTimer>
@@ -33,7 +33,7 @@ constexpr int kMenuMilliseconds = 5;
 constexpr int kRetryMilliseconds = 200;
 constexpr int kHeadOnScreen = 40; // pixels of the title that must be where a mouse can reach them
 
-// Keys that click a child. The left Ctrl key would turn a click on "open" into a batch run.
+// Keys that click a child.
 struct Key
 {
     QKeyCombination keys;
@@ -132,6 +132,7 @@ void CGaitConvertFrame::AddShortcuts()
         auto* const button = findChild<QAbstractButton*>(QLatin1String(key.child));
         add(key.keys, [button] { button->click(); });
     }
+    // No click: the left Ctrl key would make a batch run of it.
     add(Qt::CTRL | Qt::Key_O, [this] { m_spContent->OpenSource(); });
     add(QKeyCombination(Qt::Key_F), [this] { m_pkFace->FrameAll(); });
 }
@@ -145,6 +146,16 @@ void CGaitConvertFrame::OpenSoon(const std::string& path)
         else
             m_spContent->OpenDropped(path);
     });
+}
+
+void CGaitConvertFrame::RaiseAndOpen(const std::string& path)
+{
+    if (isMinimized())
+        showNormal();
+    raise();
+    activateWindow();
+    if (!path.empty())
+        OpenSoon(path);
 }
 
 void CGaitConvertFrame::closeEvent(QCloseEvent* event)

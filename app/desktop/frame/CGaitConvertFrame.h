@@ -30,6 +30,8 @@ public:
     /// Opens what somebody else names (another start of the program, a drop), as soon as nothing else is
     /// under way.
     void OpenSoon(const std::string& path);
+    /// Comes to the front, and opens a file if there is a path.
+    void RaiseAndOpen(const std::string& path);
 
 protected:
     void closeEvent(QCloseEvent* event) override;

@@ -2,15 +2,17 @@
 
 #include "Arguments.h"
 #include "CFilePlatform.h"
-#include "CGaitConvertContent.h"
 #include "CGaitConvertFrame.h"
+#include "CInstanceCounter.h"
+#include "CInstanceServer.h"
 #include "CLeftKeys.h"
+#include "CMessageBox.h"
 #include "CPreviewWidget.h"
 #include "CSkin.h"
 #include "Paths.h"
-#include "QtText.h"
+#include "QuitOnSignals.h"
 #include "RunMapTool.h"
-#include "Stubs.h"
+#include "StringTable.h"
 
 #include <QApplication>
 #include <QLocale>
@@ -22,7 +24,6 @@ namespace gw {
 
 namespace {
 
-constexpr const char* kProduct = "Gaitwright v2.0";
 constexpr const char* kSkinFolder = "Content";
 constexpr const char* kTargetFile = "base.htr";
 
@@ -31,11 +32,15 @@ constexpr const char* kUsage =
     "       GaitForge -s                        the map tool\n"
     "       GaitForge --reset-instance-counter  after a crash that blocks every start\n";
 
+constexpr const char* kBlocked =
+    "GaitForge: another one is said to run, but none answers. If it has crashed, this sets things right:\n"
+    "GaitForge --reset-instance-counter\n";
+
 // Says what keeps the program from working, in a window and for whoever started it from a shell.
 void Complain(const std::string& words)
 {
     std::fprintf(stderr, "GaitForge: %s\n", words.c_str());
-    RunMessageBox(nullptr, kProduct, words, EButtons::OK);
+    RunMessageBox(nullptr, std::string(BuiltInString(kTitleMessage)), words, EButtons::OK);
 }
 
 bool LoadSkin(CSkin& skin, const CPlatform& platform)
@@ -58,18 +63,50 @@ void CheckTarget(const CPlatform& platform)
                  "\" is missing. Motions can be looked at, and none can be converted.");
 }
 
-int RunMainWindow(const DesktopArguments& arguments, CPlatform& platform, const CLeftKeys& keys)
+// Copies of the program in different folders do not know of each other.
+std::string CounterName()
+{
+    return "gaitforge-" + std::to_string(std::hash<std::string>()(ExecutableFolder()));
+}
+
+// The program's place among its instances, given back at the end unless there was none.
+class CInstanceShare
+{
+public:
+    CInstanceShare() : m_kCounter(CounterName()), m_bOwner(m_kCounter.Enter() < 1) {}
+    ~CInstanceShare() { m_kCounter.Leave(); }
+    CInstanceShare(const CInstanceShare&) = delete;
+    CInstanceShare& operator=(const CInstanceShare&) = delete;
+
+    bool IsFirst() const { return m_bOwner; }
+
+private:
+    CInstanceCounter m_kCounter;
+    bool m_bOwner;
+};
+
+int ShowMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys& keys)
 {
     CSkin skin;
     if (!LoadSkin(skin, platform))
         return EXIT_FAILURE;
     CGaitConvertFrame frame(skin, keys, platform);
+    const CInstanceServer server([&frame](const std::string& path) { frame.RaiseAndOpen(path); });
     frame.show();
-    frame.activateWindow();
+    frame.RaiseAndOpen(file);
     CheckTarget(platform);
-    if (!arguments.file.empty())
-        frame.OpenSoon(arguments.file);
     return QApplication::exec();
+}
+
+int RunMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys& keys)
+{
+    const CInstanceShare share;
+    if (RaiseFirstInstance(file))
+        return EXIT_SUCCESS;
+    if (share.IsFirst())
+        return ShowMainWindow(file, platform, keys);
+    std::fputs(kBlocked, stderr);
+    return EXIT_FAILURE;
 }
 
 int RunTool(CPlatform& platform, const CLeftKeys& keys)
@@ -78,21 +115,60 @@ int RunTool(CPlatform& platform, const CLeftKeys& keys)
     return LoadSkin(skin, platform) ? RunMapTool(platform, keys) : EXIT_FAILURE;
 }
 
+// What needs no screen. None where a window is asked for.
+std::optional<int> RunWithoutWindow(const DesktopArguments& arguments)
+{
+    if (arguments.help)
+        return std::fputs(kUsage, stdout) < 0 ? EXIT_FAILURE : EXIT_SUCCESS;
+    if (arguments.resetCounter)
+    {
+        CInstanceCounter(CounterName()).Reset();
+        return EXIT_SUCCESS;
+    }
+    return std::nullopt;
+}
+
+// The toolkit aborts where it finds no screen.
+bool HasDisplay()
+{
+#if defined(__linux__)
+    for (const char* name : {"DISPLAY", "WAYLAND_DISPLAY", "QT_QPA_PLATFORM"})
+    {
+        if (const char* value = std::getenv(name); value && *value)
+            return true;
+    }
+    return false;
+#else
+    return true;
+#endif
+}
+
 } // namespace
 
 int RunDesktop(int argc, char** argv)
 {
+    QStringList given;
+    for (int i = 1; i < argc; ++i)
+        given << QString::fromLocal8Bit(argv[i]);
+    if (const auto code = RunWithoutWindow(ReadArguments(given)))
+        return *code;
+    if (!HasDisplay())
+    {
+        std::fputs(
+            "GaitForge: there is no display to show a window on; the program \"gaitwright\" needs none\n",
+            stderr);
+        return EXIT_FAILURE;
+    }
     RequestPreviewFormat();
-    const QApplication application(argc, argv);
+    QApplication application(argc, argv);
     QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
-    QLocale::setDefault(QLocale::c());
+    QLocale::setDefault(QLocale::c()); // numbers look and read the same on every desktop
+    QuitOnSignals(&application);
 
-    const DesktopArguments arguments = ReadArguments(QApplication::arguments().mid(1));
-    if (arguments.help)
-        return std::fputs(kUsage, stdout) < 0 ? EXIT_FAILURE : EXIT_SUCCESS;
     CFilePlatform platform(EPlatformWriting::Yes);
     const CLeftKeys keys;
-    return arguments.mapTool ? RunTool(platform, keys) : RunMainWindow(arguments, platform, keys);
+    const DesktopArguments arguments = ReadArguments(QApplication::arguments().mid(1));
+    return arguments.mapTool ? RunTool(platform, keys) : RunMainWindow(arguments.file, platform, keys);
 }
 
 } // namespace gw

@@ -16,7 +16,8 @@ QStringList NameFilters(const std::string& filter)
         QStringList patterns;
         for (const std::string& pattern : choice.patterns)
             patterns << ToQString(pattern);
-        names << ToQString(choice.text) + QLatin1Char('(') + patterns.join(QLatin1Char(' ')) + QLatin1Char(')');
+        names << ToQString(choice.text) + QLatin1Char('(') + patterns.join(QLatin1Char(' ')) +
+                     QLatin1Char(')');
     }
     return names;
 }
