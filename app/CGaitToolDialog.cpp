@@ -6,6 +6,7 @@
 #include "CWaitCursor.h"
 #include "FindBone.h"
 #include "Paths.h"
+#include "ProfileFile.h"
 #include "SourceTiming.h"
 #include "ToolStatus.h"
 
@@ -17,7 +18,9 @@ namespace gw {
 namespace {
 
 constexpr const char* kBaseFile = "base.htr";
-constexpr float kSavedScale = 0.016667f; // one frame of sixty, as the tool has always saved
+// Of sixty frames one is saved, as the tool has always done; the user is told.
+constexpr float kSavedScale = 0.016667f;
+constexpr const char* kSavedNote = ", every sixtieth frame";
 
 const CFileDialogSetup kOpenMotion{"htr", "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||", {}};
 const CFileDialogSetup kSaveMotion{"htr", "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||", {}};
@@ -33,12 +36,6 @@ void Rebuild(CBoneTree& tree, CNode* root)
     const std::string selected = tree.SelectedText();
     tree.Rebuild(root);
     tree.Select(tree.Find(selected));
-}
-
-Ref<CNode> CopyOf(CNode* root)
-{
-    CCloneMap map;
-    return root ? static_cast<CNode*>(root->Clone(map)) : nullptr;
 }
 
 } // namespace
@@ -131,12 +128,12 @@ int CGaitToolDialog::FrameOf(EToolMotion motion) const
 {
     const CMotionView* const view = View(motion);
     const float step = view ? view->GetFrameStep() : 0.0f;
-    return step > 0.0f ? static_cast<int>(std::lround(view->GetTime() / step)) : 0;
+    return step > 0.0f ? CutToInteger(std::round(view->GetTime() / step)) : 0;
 }
 
 int CGaitToolDialog::LastFrameOf(EToolMotion motion) const
 {
-    return View(motion) ? static_cast<int>(View(motion)->GetLastFrame()) : 0;
+    return View(motion) ? std::max(CutToInteger(View(motion)->GetLastFrame()), 0) : 0;
 }
 
 // ---- motions
@@ -196,7 +193,10 @@ bool CGaitToolDialog::LoadTarget(const std::string& path)
 
 bool CGaitToolDialog::LoadTargetMotions(const std::string& path)
 {
-    return Load(EToolMotion::Result, path) && Load(EToolMotion::Target, path);
+    if (!Load(EToolMotion::Result, path) || !Load(EToolMotion::Target, path))
+        return false;
+    m_kTargetPath = path;
+    return true;
 }
 
 // Reads into a file of its own: one that had trees would keep the rest pose of the motion before where the
@@ -213,7 +213,7 @@ bool CGaitToolDialog::Load(EToolMotion motion, const std::string& path)
     taken.restRoot = file.restRoot;
     taken.motionRoot = file.motionRoot;
     taken.fileVersion = file.fileVersion;
-    m_bConverted = false;
+    m_bConverted = m_bConverted && motion != EToolMotion::Result;
     m_kStatus = LoadedWords(path, file, file.Record());
     ShowMotion(motion);
     return true;
@@ -244,7 +244,8 @@ void CGaitToolDialog::Convert()
             View(motion)->Stop();
     }
     // A conversion leaves its own rest pose behind, on which the next one must not build.
-    m_kMotions[Index(EToolMotion::Result)].motionRoot = CopyOf(Root(EToolMotion::Target));
+    if (m_bConverted)
+        Load(EToolMotion::Result, m_kTargetPath);
     CRetargeter retargeter;
     retargeter.SetScenes(Root(EToolMotion::Source), Root(EToolMotion::Result));
     const CBoneNames sources(Root(EToolMotion::Source));
@@ -284,7 +285,7 @@ bool CGaitToolDialog::SaveResult(const std::string& path)
     const CWaitCursor wait(m_kWindow);
     CMotionFile& result = m_kMotions[Index(EToolMotion::Result)];
     const bool saved = result.Save(path, kSavedScale);
-    m_kStatus = saved ? SavedWords(path) : NotSavedWords(path, result.Record().Failure());
+    m_kStatus = saved ? SavedWords(path) + kSavedNote : NotSavedWords(path, result.Record().Failure());
     return saved;
 }
 

@@ -7,7 +7,6 @@
 
 #include <array>
 #include <cstddef>
-#include <cstdint>
 #include <memory>
 #include <string>
 
@@ -34,17 +33,7 @@ enum EToolControl : int
     kToolDetail = 1033,
 };
 
-/// What the five transport buttons of a motion do, in their order.
-enum class ETransport : uint8_t
-{
-    SeekStart,
-    StepBack,
-    Stop,
-    Play,
-    StepForward,
-};
-
-/// The transport buttons by motion and by what they do.
+/// The five transport buttons of each motion: to the start, a step back, stop, play, a step on.
 inline constexpr int kTransportIds[3][5] = {
     {1010, 1017, 1018, 1019, 1020},
     {1021, 1022, 1023, 1024, 1025},
@@ -147,11 +136,12 @@ private:
     CToolWindow& m_kWindow;
     const CPlatform& m_kPlatform;
     std::array<CMotionFile, 3> m_kMotions;
+    std::string m_kTargetPath; ///< of the file that target and result were read from
     std::array<std::unique_ptr<CMotionView>, 3> m_kViews;
     CBoneTree m_kSourceTree;
     CBoneTree m_kTargetTree;
     CMapLineList m_kMap;
-    bool m_bConverted = false;
+    bool m_bConverted = false; ///< the result moves after the source, and no longer stands as it was read
     std::string m_kStatus;
 };
 

@@ -497,7 +497,7 @@ TEST_F(ToolTest, TheResultIsSavedAtItsFixedScale)
     Click(kToolConvert);
     Click(kToolSaveResult, "out.htr");
     EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||");
-    EXPECT_EQ(m_kTool.Status(), "Saved out.htr");
+    EXPECT_EQ(m_kTool.Status(), "Saved out.htr, every sixtieth frame");
     EXPECT_NE(Read("out.htr").find("NumFrames 2\n"), std::string::npos) << "one frame of sixty";
 
     const struct

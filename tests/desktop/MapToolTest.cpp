@@ -113,6 +113,7 @@ void Press(const QDialog& dialog, const char* text)
 TEST_F(MapToolTest, FromASourceToASavedResult)
 {
     EXPECT_FALSE(Child<QPushButton>("1014")->isEnabled());
+    EXPECT_EQ(Child<QLabel>("panel2Frame")->text(), QString());
     LoadSourceAndMap();
     EXPECT_EQ(Status(), QStringLiteral("map.txt: 5 lines"));
     EXPECT_EQ(Line(3), QStringLiteral("hip <---> LowerTorso ."));
@@ -280,10 +281,16 @@ TEST_F(MapToolTest, EverythingIsNamedAndNothingIsCut)
     LoadSourceAndMap();
     m_kTool.resize(m_kTool.minimumSizeHint());
     QTest::qWait(0);
+    for (const char* owner : {"102", "panel0", "panel1", "panel2"})
+    {
+        const QWidget* const widget = *owner == '1' ? &m_kTool : Child<QWidget>(owner);
+        for (const QWidget* child : widget->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
+            EXPECT_FALSE(child->objectName().isEmpty())
+                << child->metaObject()->className() << " in " << owner;
+    }
     for (const QPushButton* button : m_kTool.findChildren<QPushButton*>())
     {
         SCOPED_TRACE(ToUtf8(button->objectName()));
-        EXPECT_FALSE(button->objectName().isEmpty());
         EXPECT_FALSE(button->accessibleName().isEmpty());
         EXPECT_GE(button->width(), button->minimumSizeHint().width());
         EXPECT_GE(button->height(), button->minimumSizeHint().height());
@@ -292,8 +299,8 @@ TEST_F(MapToolTest, EverythingIsNamedAndNothingIsCut)
     }
     for (const QLabel* label : m_kTool.findChildren<QLabel*>())
     {
-        if (!label->wordWrap())
-            EXPECT_GE(label->width(), label->sizeHint().width()) << ToUtf8(label->text());
+        const int needed = label->wordWrap() ? 0 : label->sizeHint().width();
+        EXPECT_GE(label->width(), needed) << ToUtf8(label->text());
     }
 }
 

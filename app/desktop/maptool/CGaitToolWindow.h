@@ -6,6 +6,8 @@
 #include <QStringListModel>
 #include <QTimer>
 #include <array>
+#include <functional>
+#include <initializer_list>
 #include <vector>
 
 class QGridLayout;
@@ -43,8 +45,9 @@ private:
     void BeginWaitCursor() override;
     void EndWaitCursor() override;
 
-    // From the top of the window to its bottom, which is the order of the tab key.
+    // ToolLayout.cpp
     void MakeMenu();
+    void MakeLayout(const CLeftKeys& keys);
     void MakeTop(QGridLayout& grid);
     void MakePanels(QGridLayout& grid, const CLeftKeys& keys);
     void MakeTrees(QGridLayout& grid);
@@ -55,14 +58,13 @@ private:
     CMotionPanel& Panel(EToolMotion motion) { return *m_kPanels[static_cast<size_t>(motion)]; }
 
     /// Hands something to the tool and shows what came of it.
-    template <class F>
-    void Forward(F operation);
+    void Forward(const std::function<void()>& operation);
+    void SelectLine(const QModelIndex& line);
     void Click(int id);
     void Tick();
     void Refresh();
     void ShowFrames();
     void ShowLines();
-    void ShowAbout();
 
     std::array<CMotionPanel*, 3> m_kPanels{};
     CBoneTreeView* m_pkSourceTree = nullptr;

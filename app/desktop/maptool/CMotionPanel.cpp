@@ -35,7 +35,7 @@ struct TransportButton
     const char* m_pcName;
 };
 
-// In the order of ETransport.
+// In the order of kTransportIds.
 constexpr TransportButton kTransportButtons[] = {
     {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "To the first frame")},
     {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "One frame back")    },
@@ -71,25 +71,23 @@ CMotionPanel::CMotionPanel(EToolMotion motion, const CLeftKeys& keys, QWidget* p
     auto* const layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
     layout->setSpacing(kGap);
-    layout->addWidget(MakeCaption());
+    layout->addLayout(MakeCaption());
     layout->addWidget(MakePicture(keys), 1);
-    layout->addWidget(MakeTransport());
+    layout->addLayout(MakeTransport());
 }
 
-QWidget* CMotionPanel::MakeCaption()
+QLayout* CMotionPanel::MakeCaption()
 {
-    auto* const row = new QWidget(this);
-    auto* const caption = new QLabel(CaptionOf(m_eMotion), row);
+    auto* const caption = new QLabel(CaptionOf(m_eMotion), this);
     caption->setObjectName(objectName() + QStringLiteral("Caption"));
     caption->setProperty("kind", QStringLiteral("text"));
-    m_pkFrame = new QLabel(row);
+    m_pkFrame = new QLabel(this);
     m_pkFrame->setObjectName(objectName() + QStringLiteral("Frame"));
     m_pkFrame->setProperty("kind", QStringLiteral("value"));
-    auto* const layout = new QHBoxLayout(row);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->addWidget(caption);
-    layout->addStretch();
-    layout->addWidget(m_pkFrame);
+    auto* const row = new QHBoxLayout;
+    row->addWidget(caption);
+    row->addStretch();
+    row->addWidget(m_pkFrame);
     return row;
 }
 
@@ -113,23 +111,21 @@ QWidget* CMotionPanel::MakePicture(const CLeftKeys& keys)
     return picture;
 }
 
-QWidget* CMotionPanel::MakeTransport()
+QLayout* CMotionPanel::MakeTransport()
 {
-    auto* const row = new QWidget(this);
-    auto* const layout = new QHBoxLayout(row);
-    layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(kGap);
-    layout->addStretch();
+    auto* const row = new QHBoxLayout;
+    row->setSpacing(kGap);
+    row->addStretch();
     const int* id = kTransportIds[static_cast<size_t>(m_eMotion)];
     for (const auto& [icon, name] : kTransportButtons)
     {
-        auto* const button = new CIconButton(icon, QCoreApplication::translate(kContext, name), row);
+        auto* const button = new CIconButton(icon, QCoreApplication::translate(kContext, name), this);
         button->setObjectName(QString::number(*id));
         connect(button, &QPushButton::clicked, this, [this, id = *id] { m_kClicked(id); });
-        layout->addWidget(button);
+        row->addWidget(button);
         ++id;
     }
-    layout->addStretch();
+    row->addStretch();
     return row;
 }
 

@@ -7,6 +7,7 @@
 #include <memory>
 
 class QLabel;
+class QLayout;
 
 namespace gw {
 
@@ -34,9 +35,9 @@ protected:
     void dropEvent(QDropEvent* event) override;
 
 private:
-    QWidget* MakeCaption();
+    QLayout* MakeCaption();
     QWidget* MakePicture(const CLeftKeys& keys);
-    QWidget* MakeTransport();
+    QLayout* MakeTransport();
 
     EToolMotion m_eMotion;
     QLabel* m_pkFrame = nullptr;

@@ -1,0 +1,10 @@
+#pragma once
+
+class QWidget;
+
+namespace gw {
+
+/// Shows the map tool's name and the program's version over a window until the user ends it.
+void ShowAboutBox(QWidget& owner);
+
+} // namespace gw
