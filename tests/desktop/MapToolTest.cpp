@@ -5,6 +5,7 @@
 #include "CPreviewWidget.h"
 #include "ContentFixture.h"
 #include "QtText.h"
+#include "RunMapTool.h"
 
 #include <QApplication>
 #include <QDragEnterEvent>
@@ -273,6 +274,18 @@ TEST_F(MapToolTest, TheWindowMenuOpensTheAboutBox)
     EXPECT_TRUE(m_kTool.isVisible()) << "the Escape key loses no map";
     Click("1");
     EXPECT_FALSE(m_kTool.isVisible());
+}
+
+TEST_F(MapToolTest, TheProgramRunsUntilTheToolIsClosed)
+{
+    m_kTool.hide();
+    QTimer::singleShot(0, [] {
+        auto* const tool = QApplication::activeModalWidget();
+        ASSERT_NE(tool, nullptr);
+        EXPECT_EQ(tool->windowTitle(), QStringLiteral("GaitTool"));
+        tool->findChild<QPushButton*>(QStringLiteral("1"))->click();
+    });
+    EXPECT_EQ(RunMapTool(m_kPlatform, m_kKeys), 0);
 }
 
 // At the smallest size that the window takes.
