@@ -4,10 +4,10 @@
 #include "CGaitConvertContent.h"
 #include "CMessageBox.h"
 #include "CSelectFolderDialog.h"
+#include "DesktopServices.h"
 #include "FileDialog.h"
 #include "QtText.h"
 #include "StringTable.h"
-#include "Stubs.h"
 
 #include <QGuiApplication>
 
