@@ -6,11 +6,11 @@
 #include "CWaitCursor.h"
 #include "FailureWords.h"
 #include "FindBone.h"
+#include "FitWords.h"
 #include "Mat4.h"
 #include "ProfileFit.h"
 #include "SourceTiming.h"
 #include "StringTable.h"
-#include "Text.h"
 
 #include <span>
 
@@ -120,20 +120,19 @@ void CGaitConvertContent::ReportMisfit()
     m_kWindow.Report(MakeReport(m_kProfilePath, misfit));
 }
 
-// Reports each row that names a bone which is not there; false when there is none.
+// Reports the rows that name bones which are not there; false when there is none. A profile that lies in its
+// file as it is tells the lines.
 bool CGaitConvertContent::ReportMissingBones()
 {
-    const CProfileFit fit =
-        MeasureFit(m_pkProfileDialog->Rows(), SourceRoot(), m_kResultMotion.motionRoot.Get());
-    for (const CMissingBone& bone : fit.missing)
+    CNode* const target = m_kResultMotion.motionRoot.Get();
+    CProfileFit fit;
+    if (m_pkProfileDialog->IsDirty() || !MeasureFit(m_kProfilePath, SourceRoot(), target, fit))
     {
-        const bool isSource = bone.side == ESkeletonSide::Source;
-        CReport report =
-            MakeReport(m_kProfilePath, isSource ? EMisfit::NoSourceBone : EMisfit::NoTargetBone, bone.name);
-        if (!bone.nearest.empty())
-            report.words += "; the nearest name is \"" + Printable(bone.nearest) + '"';
-        m_kWindow.Report(report);
+        fit = MeasureFit(m_pkProfileDialog->Rows(), SourceRoot(), target);
+        m_pkProfile->GetProfileName(fit.name);
     }
+    if (!fit.missing.empty())
+        m_kWindow.Report(MisfitReport(m_kSourcePath, fit));
     return !fit.missing.empty();
 }
 

@@ -79,8 +79,6 @@ constexpr Words<EMisfit> kMisfits[] = {
         "see that base.htr lies beside the program"),
     Row(EMisfit::NoProfile, "no-profile", "no profile is selected",
         "choose one that fits the source's bones"),
-    Row(EMisfit::NoSourceBone, "no-source-bone", "the source has no bone of a name in the profile"),
-    Row(EMisfit::NoTargetBone, "no-target-bone", "the target has no bone of a name in the profile"),
     Row(EMisfit::NoRootRow, "no-root-row", "no row of the profile drives the target's root bone", kMapHip),
     Row(EMisfit::NoRootSource, "no-root-source", "the profile keeps the target's root bone fixed", kMapHip),
 };

@@ -14,8 +14,6 @@ enum class EMisfit : uint8_t
 {
     NoScene,      ///< no source is open, or base.htr could not be read
     NoProfile,    ///< no profile is selected
-    NoSourceBone, ///< a row names a bone that the source does not have
-    NoTargetBone, ///< a row names a bone that the target does not have
     NoRootRow,    ///< no row drives the target's root bone
     NoRootSource, ///< the row of the target's root bone is fixed
 };

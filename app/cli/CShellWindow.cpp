@@ -70,9 +70,7 @@ void CShellWindow::Report(const CReport& report)
 {
     m_kReports.push_back(report);
     m_bFailed = m_bFailed || !report.warning;
-    const bool isMissingBone = report.code == "no-source-bone" || report.code == "no-target-bone";
-    if (m_bTellsMissingBones || !isMissingBone)
-        SayReport(m_kOptions, report);
+    SayReport(m_kOptions, report);
 }
 
 void CShellWindow::ShowBatchFile(size_t index, size_t count, const std::string& path)

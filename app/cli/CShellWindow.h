@@ -30,9 +30,6 @@ public:
     size_t BatchFileCount() const { return m_uiBatchFiles; }
     /// Whether a child takes a click, as the conversion last said.
     bool IsEnabled(std::string_view child) const { return m_kEnabled.contains(child); }
-    /// From now on bones that a profile names in vain are not told one by one, since the caller tells them
-    /// better.
-    void PassOverMissingBones() { m_bTellsMissingBones = false; }
 
     EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
     std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
@@ -53,7 +50,6 @@ private:
     std::vector<CReport> m_kReports;
     size_t m_uiBatchFiles = 0;
     bool m_bFailed = false;
-    bool m_bTellsMissingBones = true;
 };
 
 } // namespace gw

@@ -5,8 +5,8 @@
 #include "CJsonWriter.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
-#include "FitWords.h"
 #include "Output.h"
+#include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "ReportJson.h"
 #include "Text.h"
@@ -57,7 +57,7 @@ private:
     bool MayConvert();
     bool Convert();
     bool Save() { return m_kContent.SaveResult() != 0 && !m_kWindow.HasFailed(); }
-    void TellMisfit();
+    void KeepMisfit();
     bool RefuseEmpty();
 
     const COptions& m_kOptions;
@@ -103,10 +103,9 @@ bool CConversion::RefuseEmpty()
 
 bool CConversion::Convert()
 {
-    m_kWindow.PassOverMissingBones();
     if (m_kContent.ConvertMotion() == 0)
     {
-        TellMisfit();
+        KeepMisfit();
         return false;
     }
     if (m_kWindow.HasFailed())
@@ -115,14 +114,11 @@ bool CConversion::Convert()
     return m_kAccount.frames > 0 || RefuseEmpty(); // a container may say that it ends before it begins
 }
 
-// Where no bone is missing, the reason was reported.
-void CConversion::TellMisfit()
+void CConversion::KeepMisfit()
 {
     CProfileFit fit;
-    if (!m_kContent.Measure(m_kContent.ProfilePath(), fit) || fit.missing.empty())
-        return;
-    m_kWindow.Report(MisfitReport(m_kJob.source, fit));
-    m_kAccount.misfit = fit;
+    if (m_kContent.Measure(m_kContent.ProfilePath(), fit) && !fit.missing.empty())
+        m_kAccount.misfit = fit;
 }
 
 EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)

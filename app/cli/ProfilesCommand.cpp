@@ -4,6 +4,7 @@
 #include "CShellWindow.h"
 #include "Commands.h"
 #include "FitWords.h"
+#include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "Text.h"
 #include "Words.h"

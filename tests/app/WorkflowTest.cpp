@@ -171,10 +171,10 @@ TEST_F(ContentTest, AProfileThatDoesNotFitStopsTheConversion)
         std::string rows;
         const char* words;
     } rows[] = {
-        {"no row for the root bone", legs,                             "no-root-row, 144"        },
-        {"a fixed row for it",       legs + "* LowerTorso . .1,2,3\n", "no-root-source, 144"     },
-        {"a bone the source lacks",  hip + "hop <---> LThigh 0\n",     "no-source-bone hop, 144" },
-        {"a bone the target lacks",  hip + "hip <---> Tail 0\n",       "no-target-bone Tail, 144"},
+        {"no row for the root bone", legs,                             "no-root-row, 144"   },
+        {"a fixed row for it",       legs + "* LowerTorso . .1,2,3\n", "no-root-source, 144"},
+        {"a bone the source lacks",  hip + "hop <---> LThigh 0\n",     "misfit, 144"        },
+        {"a bone the target lacks",  hip + "hip <---> Tail 0\n",       "misfit, 144"        },
     };
     OpenAndConvert();
     for (const auto& row : rows)

@@ -1,8 +1,8 @@
-#include "FitWords.h"
+#include "ProfileChoice.h"
 
 #include "CJsonWriter.h"
 #include "CReport.h"
-#include "HostBones.h"
+#include "FitWords.h"
 #include "ProfileFit.h"
 #include "Words.h"
 
@@ -11,19 +11,6 @@
 namespace gw {
 
 namespace {
-
-const char* SideName(ESkeletonSide side)
-{
-    return side == ESkeletonSide::Source ? "source" : "target";
-}
-
-std::string MissingLine(const CMissingBone& missing)
-{
-    const std::string place = missing.line == 0 ? "" : "line " + std::to_string(missing.line) + ": ";
-    const std::string nearest =
-        missing.nearest.empty() ? "; no name is near" : "; the nearest is " + Quoted(missing.nearest);
-    return "  " + place + "the " + SideName(missing.side) + " has no bone " + Quoted(missing.name) + nearest;
-}
 
 // Larger is better.
 auto Rank(const CProfileFit& fit)
@@ -37,32 +24,6 @@ auto Rank(const CProfileFit& fit)
 bool IsBetterFit(const CProfileFit& fit, const CProfileFit& other)
 {
     return other.rowCount == 0 || Rank(fit) > Rank(other);
-}
-
-std::string FitSummary(const CProfileFit& fit)
-{
-    if (fit.foundCount != fit.rowCount)
-        return std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + " rows fit";
-    return std::to_string(fit.rowCount) + " rows, all fit";
-}
-
-std::string MissingLines(const CProfileFit& fit)
-{
-    std::string lines;
-    for (const CMissingBone& missing : fit.missing)
-    {
-        lines += lines.empty() ? "" : "\n";
-        lines += MissingLine(missing);
-    }
-    if (!fit.drivesRoot && fit.missing.empty())
-        lines = "  no row drives the target's root bone " + Quoted(kRootBone);
-    return lines;
-}
-
-CReport MisfitReport(const std::string& source, const CProfileFit& fit)
-{
-    return ShellFailure(source, "misfit",
-                        "profile " + Quoted(fit.name) + ": " + FitSummary(fit) + '\n' + MissingLines(fit));
 }
 
 CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest)

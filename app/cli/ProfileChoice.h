@@ -12,13 +12,8 @@ struct CReport;
 /// not, more rows before fewer, and of those that do not fit the one that misses less.
 bool IsBetterFit(const CProfileFit& fit, const CProfileFit& other);
 
-/// "23 rows, all fit" or "20 of 23 rows fit".
-std::string FitSummary(const CProfileFit& fit);
-/// What a profile misses, one line each, with the nearest names.
-std::string MissingLines(const CProfileFit& fit);
-/// Why a source is not converted by a profile.
-CReport MisfitReport(const std::string& source, const CProfileFit& fit);
-/// Why it is converted by no installed one, with the one that comes nearest; without rows none is installed.
+/// Why a source is converted by no installed profile, with the one that comes nearest; without rows none is
+/// installed.
 CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest);
 /// The same as members of a JSON object.
 void WriteFit(CJsonWriter& json, const CProfileFit& fit);

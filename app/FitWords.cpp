@@ -1,0 +1,62 @@
+#include "FitWords.h"
+
+#include "CReport.h"
+#include "HostBones.h"
+#include "ProfileFit.h"
+#include "Text.h"
+
+namespace gw {
+
+namespace {
+
+std::string Quoted(std::string_view name)
+{
+    std::string text = "\"";
+    return text.append(Printable(name)).append("\"");
+}
+
+std::string MissingLine(const CMissingBone& missing)
+{
+    const std::string place = missing.line == 0 ? "" : "line " + std::to_string(missing.line) + ": ";
+    const std::string nearest =
+        missing.nearest.empty() ? "; no name is near" : "; the nearest is " + Quoted(missing.nearest);
+    return "  " + place + "the " + SideName(missing.side) + " has no bone " + Quoted(missing.name) + nearest;
+}
+
+} // namespace
+
+const char* SideName(ESkeletonSide side)
+{
+    return side == ESkeletonSide::Source ? "source" : "target";
+}
+
+std::string FitSummary(const CProfileFit& fit)
+{
+    if (fit.foundCount != fit.rowCount)
+        return std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + " rows fit";
+    return std::to_string(fit.rowCount) + " rows, all fit";
+}
+
+std::string MissingLines(const CProfileFit& fit)
+{
+    std::string lines;
+    for (const CMissingBone& missing : fit.missing)
+    {
+        lines += lines.empty() ? "" : "\n";
+        lines += MissingLine(missing);
+    }
+    if (!fit.drivesRoot && fit.missing.empty())
+        lines = "  no row drives the target's root bone " + Quoted(kRootBone);
+    return lines;
+}
+
+CReport MisfitReport(const std::string& source, const CProfileFit& fit)
+{
+    CReport report;
+    report.path = source;
+    report.code = "misfit";
+    report.words = "profile " + Quoted(fit.name) + ": " + FitSummary(fit) + '\n' + MissingLines(fit);
+    return report;
+}
+
+} // namespace gw
