@@ -13,10 +13,12 @@
 #include <QCoreApplication>
 #include <QDir>
 #include <QFileSystemModel>
+#include <QIcon>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
 #include <QListView>
+#include <QPixmap>
 #include <QPushButton>
 #include <QStandardPaths>
 #include <QStyle>
@@ -36,11 +38,17 @@ QString Own(const char* text)
     return QCoreApplication::translate("CSelectFolderDialog", text);
 }
 
-// Files are there to be seen: they tell that this is the right folder, and cannot be chosen.
+// Files are there to be seen: they tell that this is the right folder, and cannot be chosen. The model's own
+// icons are there only where a desktop's theme is.
 class CFolderModel : public QFileSystemModel
 {
 public:
-    using QFileSystemModel::QFileSystemModel;
+    explicit CFolderModel(QObject* parent)
+        : QFileSystemModel(parent), m_kFolderIcon(QApplication::style()->standardIcon(QStyle::SP_DirIcon)),
+          m_kNoIcon(kIconSide, kIconSide)
+    {
+        m_kNoIcon.fill(Qt::transparent);
+    }
 
     Qt::ItemFlags flags(const QModelIndex& index) const override
     {
@@ -48,13 +56,16 @@ public:
         return isDir(index) ? all : all & ~(Qt::ItemIsEnabled | Qt::ItemIsSelectable);
     }
 
-    // The model's own icons are there only where a desktop's theme is.
     QVariant data(const QModelIndex& index, int role) const override
     {
         if (role != Qt::DecorationRole)
             return QFileSystemModel::data(index, role);
-        return QApplication::style()->standardIcon(isDir(index) ? QStyle::SP_DirIcon : QStyle::SP_FileIcon);
+        return isDir(index) ? QVariant(m_kFolderIcon) : QVariant(m_kNoIcon);
     }
+
+private:
+    QIcon m_kFolderIcon;
+    QPixmap m_kNoIcon; // keeps the names in one column
 };
 
 QString BeginningFolder(const std::string& wanted)
