@@ -129,6 +129,8 @@ class Program(unittest.TestCase):
         tool = self.home.start("-s")
         time.sleep(1)
         self.assertIsNone(tool.poll())
+        tool.send_signal(signal.SIGTERM)
+        self.assertEqual(tool.wait(PATIENCE), 0)
 
 
 if __name__ == "__main__":
