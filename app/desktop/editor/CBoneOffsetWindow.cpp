@@ -50,7 +50,7 @@ CBoneOffsetWindow::CBoneOffsetWindow(const CGaitConvertContent& content, CBoneOf
     layout->setSizeConstraint(QLayout::SetFixedSize);
     layout->addLayout(MakeNumbers(content));
     layout->addLayout(MakeButtons());
-    ShowNumbers();
+    ShowAxes();
     m_pkRotation[0]->setFocus();
     m_pkRotation[0]->selectAll();
 }
@@ -81,6 +81,7 @@ CFieldEdit* CBoneOffsetWindow::MakeRotation(int axis)
     auto* const field = new CFieldEdit(this);
     field->setObjectName(QStringLiteral("rotation") + AxisLetter(axis));
     field->setAccessibleName(tr("Rotation around %1 in degrees").arg(AxisLetter(axis)));
+    field->setText(ToQString(m_kDialog.RotationText(axis)));
     field->setAlignment(Qt::AlignRight);
     field->SetOnLeave([=, this] { LeaveRotation(axis); });
     m_pkRotation[static_cast<size_t>(axis)] = field;
@@ -96,7 +97,7 @@ QComboBox* CBoneOffsetWindow::MakeAxis(int axis)
         box->addItem(ToQString(entry));
     connect(box, &QComboBox::activated, this, [=, this](int entry) {
         m_kDialog.ChooseAxis(axis, entry);
-        ShowNumbers();
+        ShowAxes();
     });
     m_pkAxis[static_cast<size_t>(axis)] = box;
     return box;
@@ -127,19 +128,18 @@ void CBoneOffsetWindow::accept()
     QDialog::accept();
 }
 
+// Shows this field alone: another one may hold what is still to be read.
 void CBoneOffsetWindow::LeaveRotation(int axis)
 {
-    m_kDialog.LeaveRotation(axis, ToUtf8(m_pkRotation[static_cast<size_t>(axis)]->text()));
-    ShowNumbers();
+    CFieldEdit* const field = m_pkRotation[static_cast<size_t>(axis)];
+    m_kDialog.LeaveRotation(axis, ToUtf8(field->text()));
+    field->ShowText(ToQString(m_kDialog.RotationText(axis)));
 }
 
-void CBoneOffsetWindow::ShowNumbers()
+void CBoneOffsetWindow::ShowAxes()
 {
     for (int axis = 0; axis < kAxisCount; ++axis)
-    {
-        m_pkRotation[static_cast<size_t>(axis)]->ShowText(ToQString(m_kDialog.RotationText(axis)));
         m_pkAxis[static_cast<size_t>(axis)]->setCurrentIndex(m_kDialog.AxisEntry(axis));
-    }
 }
 
 } // namespace gw

@@ -28,7 +28,7 @@ private:
     QComboBox* MakeAxis(int axis);
     QLayout* MakeButtons();
     void LeaveRotation(int axis);
-    void ShowNumbers();
+    void ShowAxes();
 
     CBoneOffsetDialog& m_kDialog;
     std::array<CFieldEdit*, kAxisCount> m_pkRotation{};

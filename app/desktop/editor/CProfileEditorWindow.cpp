@@ -38,6 +38,13 @@ CProfileEditorWindow::CProfileEditorWindow(CGaitConvertContent& content, CPlatfo
     m_kControls.m_pkSourceTree->setFocus();
 }
 
+// A window that goes while it is visible takes the focus from its fields, when nobody is left to hear of it.
+CProfileEditorWindow::~CProfileEditorWindow()
+{
+    for (const auto& [id, edit] : m_kControls.m_kFields)
+        edit->SetOnLeave({});
+}
+
 void CProfileEditorWindow::ConnectFields()
 {
     for (const auto& [id, edit] : m_kControls.m_kFields)

@@ -17,6 +17,7 @@ class CProfileEditorWindow : public QDialog
 public:
     /// Model, texts and questions are the content's; both it and the platform must outlive the window.
     CProfileEditorWindow(CGaitConvertContent& content, CPlatform& platform, QWidget* owner);
+    ~CProfileEditorWindow() override;
 
     /// Shows or hides the window as the model says: placement restored at the first showing, stored when it
     /// is hidden.

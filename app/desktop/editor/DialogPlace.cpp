@@ -44,6 +44,7 @@ void WriteDialogPlace(CPlatform& platform, const QWidget& window)
     if (window.isMinimized() || window.isMaximized())
         return;
     WindowPlacement placement;
+    placement.minimisedX = placement.minimisedY = placement.maximisedX = placement.maximisedY = -1; // none
     placement.left = window.x();
     placement.top = window.y();
     placement.right = window.x() + window.width();

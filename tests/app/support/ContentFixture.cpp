@@ -15,6 +15,7 @@ EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButton
 {
     m_kCalls.push_back("box " + std::to_string(id));
     m_kBoxes.push_back(text);
+    m_kOnBox();
     const auto answer = m_kAnswers.find(id);
     return answer == m_kAnswers.end() ? EAnswer::OK : answer->second;
 }

@@ -79,6 +79,7 @@ public:
     std::set<EKey> m_kKeys;
     std::function<void(const std::string& path)>
         m_kOnBatchFile; ///< what happens while a batch takes up a file
+    std::function<void()> m_kOnBox = [] {}; ///< what else happens while a message box is open
     std::function<void(bool shown)> m_kOnShowEditor = [](bool) {};
     std::function<void()> m_kOnRefreshEditor = [] {};
     std::function<bool(CBoneOffsetDialog& dialog)> m_kOnBoneOffset = [](CBoneOffsetDialog&) { return false; };

@@ -1,0 +1,272 @@
+// A person renames a profile, sets its rate and a row's offset, saves, and comes and goes.
+#include "EditorFixture.h"
+
+#include "CBoneOffsetWindow.h"
+#include "WindowPlacement.h"
+
+#include <QApplication>
+#include <QComboBox>
+#include <QScreen>
+#include <QTest>
+#include <filesystem>
+#include <gmock/gmock.h>
+
+namespace gw {
+
+using testing::ElementsAre;
+using testing::IsEmpty;
+
+namespace {
+
+class EditorFields : public EditorTest
+{
+protected:
+    EditorFields() { OpenEditor(); }
+};
+
+void TypeInto(QWidget& dialog, const char* field, const char* text)
+{
+    auto* const edit = dialog.findChild<QLineEdit*>(QLatin1String(field));
+    edit->setFocus();
+    edit->selectAll();
+    QTest::keyClicks(edit, QLatin1String(text));
+}
+
+void ClickIn(QWidget& dialog, const char* button)
+{
+    QTest::mouseClick(dialog.findChild<QPushButton*>(QLatin1String(button)), Qt::LeftButton);
+}
+
+} // namespace
+
+TEST_F(EditorFields, EnterCommitsARateAndKeepsTheWindow)
+{
+    Type(kFrameRateField, "60");
+    Press(Qt::Key_Return);
+    EXPECT_TRUE(m_kEditor.isVisible());
+    EXPECT_EQ(QApplication::focusWidget(), &m_kEditor);
+    EXPECT_EQ(Model().GetFrameRate(), 60);
+    EXPECT_TRUE(IsEnabled(kSaveProfileButton));
+}
+
+TEST_F(EditorFields, ARateOutsideItsLimitsIsClampedAndSaid)
+{
+    Type(kFrameRateField, "10");
+    Press(Qt::Key_Tab);
+    EXPECT_THAT(m_kWindow.m_kBoxes, ElementsAre("The avaliable value is 30 to 240."));
+    EXPECT_EQ(Field(kFrameRateField), "30");
+    EXPECT_FALSE(IsEnabled(kSaveProfileButton));
+}
+
+TEST_F(EditorFields, ANewNameIsTakenAndATakenOneRefused)
+{
+    Type(kNameField, "Dancer");
+    Press(Qt::Key_Tab);
+    EXPECT_THAT(TakeBoxes(), IsEmpty());
+    EXPECT_TRUE(IsEnabled(kSaveProfileButton));
+    Type(kNameField, "mine");
+    Press(Qt::Key_Tab);
+    EXPECT_THAT(TakeBoxes(), ElementsAre("box 158"));
+    EXPECT_EQ(Field(kNameField), "Dancer");
+    EXPECT_FALSE(IsEnabled(kSaveProfileButton)) << "a refusal forgets that something was to be saved";
+}
+
+TEST_F(EditorFields, AMessageThatTakesTheFocusIsShownOnce)
+{
+    m_kWindow.m_kOnBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
+    Type(kNameField, "mine");
+    Child<QLineEdit>(kFrameRateField).setFocus();
+    EXPECT_THAT(TakeBoxes(), ElementsAre("box 158"));
+}
+
+TEST_F(EditorFields, UndoTakesBackTypingInAFieldAndCommandsOutsideIt)
+{
+    Type(kFrameRateField, "60");
+    Press(Qt::Key_Return);
+    Type(kNameField, "Dancer");
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_NE(Field(kNameField), "Dancer");
+    EXPECT_EQ(Model().GetFrameRate(), 60) << "the field's own typing came first";
+    Type(kNameField, "Dancer");
+    Press(Qt::Key_Tab);
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Field(kNameField), "Poser") << "also from within a field that nothing was typed into";
+    Press(Qt::Key_Z, Qt::ControlModifier);
+    EXPECT_EQ(Field(kFrameRateField), "30");
+}
+
+TEST_F(EditorFields, AStockProfilesChangeIsSavedUnderANewName)
+{
+    const std::string stock = m_kFolder.Path("data/PoserBVH.prf");
+    std::filesystem::permissions(stock, std::filesystem::perms::owner_read);
+    const std::string untouched = ReadBytes(stock);
+    Type(kFrameRateField, "60");
+    Press(Qt::Key_Return);
+    EXPECT_EQ(Field(kNameField), "Poser(1)");
+    Click(kSaveProfileButton);
+    EXPECT_THAT(TakeBoxes(), ElementsAre("box 159"));
+    EXPECT_TRUE(Read("docs/BVH Profile/Custom1.prf").starts_with("Poser(1)\nFrameRate 60\n"));
+    EXPECT_EQ(ReadBytes(stock), untouched);
+    EXPECT_FALSE(IsEnabled(kSaveProfileButton));
+    EXPECT_EQ(SelectedProfile(), "Poser(1)");
+}
+
+TEST_F(EditorFields, ADoubleClickOpensARowsOffset)
+{
+    InOffsetDialog([](QWidget& dialog) {
+        EXPECT_EQ(dialog.windowTitle(), QStringLiteral("GaitTool (Bone Offset)"));
+        TypeInto(dialog, "rotationX", "180");
+        TypeInto(dialog, "rotationY", "180");
+        auto* const box = dialog.findChild<QComboBox*>(QStringLiteral("axisX"));
+        box->setFocus();
+        QTest::keyClick(box, Qt::Key_End);
+        EXPECT_EQ(box->currentText(), QStringLiteral("-Z"));
+        EXPECT_EQ(dialog.findChild<QComboBox*>(QStringLiteral("axisZ"))->currentText(), QStringLiteral("X"));
+        EXPECT_EQ(dialog.findChild<QLineEdit*>(QStringLiteral("rotationY"))->text(), QStringLiteral("0"))
+            << "only X turns by half a circle";
+        ClickIn(dialog, "ok");
+    });
+    DoubleClickRow(2);
+    EXPECT_EQ(Rows()[2], "lShin > LCalf 180 0 0 -Z  Y  X");
+    EXPECT_TRUE(IsEnabled(kSaveProfileButton));
+}
+
+TEST_F(EditorFields, EnterInTheOffsetDialogTakesTheFieldAlong)
+{
+    ClickRow(1);
+    InOffsetDialog([](QWidget& dialog) {
+        TypeInto(dialog, "rotationZ", "-45");
+        QTest::keyClick(QApplication::focusWidget(), Qt::Key_Return);
+    });
+    Click(kBoneOffsetButton);
+    EXPECT_EQ(Rows()[1], "lThigh > LThigh 0 0 -45");
+}
+
+TEST_F(EditorFields, ACancelledOffsetChangesNothing)
+{
+    ClickRow(1);
+    for (const bool byKey : {false, true})
+    {
+        InOffsetDialog([=](QWidget& dialog) {
+            TypeInto(dialog, "rotationZ", "-45");
+            if (byKey)
+                QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+            else
+                ClickIn(dialog, "cancel");
+        });
+        Click(kBoneOffsetButton);
+        EXPECT_EQ(Rows()[1], "lThigh > LThigh 0 0 0");
+        EXPECT_FALSE(IsEnabled(kSaveProfileButton));
+    }
+}
+
+TEST_F(EditorFields, EscapeCommitsAndClosesAndTheToggleComesUp)
+{
+    m_kWindow.m_bButtonState = true;
+    Type(kFrameRateField, "60");
+    QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
+    Settle();
+    EXPECT_FALSE(m_kEditor.isVisible());
+    EXPECT_FALSE(Model().IsVisible());
+    EXPECT_FALSE(m_kWindow.m_bButtonState);
+    EXPECT_EQ(Model().GetFrameRate(), 60);
+    Toggle(true);
+    EXPECT_EQ(Field(kFrameRateField), "60") << "its state is the profile, seen or not";
+}
+
+TEST_F(EditorFields, EscapeClosesFromTreesAndListToo)
+{
+    for (const int id : {kSourceTree, kMapRowList, kRemoveAllButton})
+    {
+        Child<QWidget>(id).setFocus();
+        Press(Qt::Key_Escape);
+        EXPECT_FALSE(m_kEditor.isVisible()) << id;
+        Toggle(true);
+        ASSERT_TRUE(QTest::qWaitForWindowActive(&m_kEditor));
+    }
+}
+
+TEST_F(EditorFields, WhatChangesWhileTheWindowIsHiddenIsSeenLater)
+{
+    m_kEditor.close();
+    EXPECT_FALSE(Model().IsVisible());
+    m_kContent.UseProfileFile(m_kFolder.Path("docs/BVH Profile/Custom0.prf"));
+    Toggle(true);
+    EXPECT_EQ(Field(kNameField), "Mine");
+}
+
+// ---- places
+
+class EditorPlace : public EditorTest
+{
+protected:
+    /// The place that the settings hold once the window was opened and closed.
+    WindowPlacement OpenAndClose()
+    {
+        OpenEditor();
+        Toggle(false);
+        WindowPlacement placement;
+        EXPECT_TRUE(ScanPlacement(m_kPlatform.ReadSetting("DialogPos"), placement));
+        return placement;
+    }
+    QPoint OpenAt(const WindowPlacement& placement)
+    {
+        CProfileEditorWindow window(m_kContent, m_kPlatform, &m_kOwner);
+        m_kPlatform.WriteSetting("DialogPos", PlacementText(placement));
+        window.SetShown(true);
+        EXPECT_TRUE(QTest::qWaitForWindowExposed(&window));
+        return window.pos();
+    }
+};
+
+TEST_F(EditorPlace, AWindowComesBackToWhereItWas)
+{
+    OpenEditor();
+    m_kEditor.move(123, 45);
+    m_kEditor.close();
+    WindowPlacement placement;
+    ASSERT_TRUE(ScanPlacement(m_kPlatform.ReadSetting("DialogPos"), placement));
+    EXPECT_EQ(placement.left, 123);
+    EXPECT_EQ(placement.top, 45);
+    EXPECT_EQ(OpenAt(placement), QPoint(123, 45));
+}
+
+TEST_F(EditorPlace, APlaceOfAnotherSizeOrOffTheScreensIsNotUsed)
+{
+    const WindowPlacement usual = OpenAndClose();
+    const struct
+    {
+        const char* what;
+        int left, top, width, height;
+        bool used;
+    } rows[] = {
+        {"elsewhere on the screen", 200,    100,     0, 0,  true },
+        {"wider",                   200,    100,     1, 0,  false},
+        {"lower",                   200,    100,     0, -1, false},
+        {"far away",                90'000, 100,     0, 0,  false},
+        {"above all screens",       200,    -90'000, 0, 0,  false},
+    };
+    for (const auto& row : rows)
+    {
+        WindowPlacement placement;
+        placement.left = row.left;
+        placement.top = row.top;
+        placement.right = row.left + usual.right - usual.left + row.width;
+        placement.bottom = row.top + usual.bottom - usual.top + row.height;
+        EXPECT_EQ(OpenAt(placement) == QPoint(row.left, row.top), row.used) << row.what;
+    }
+    m_kPlatform.WriteSetting("DialogPos", "0,1,-1,-1,-1,-1,200,100,2147483647");
+    CProfileEditorWindow window(m_kContent, m_kPlatform, &m_kOwner);
+    window.SetShown(true);
+    EXPECT_NE(window.pos(), QPoint(200, 100)) << "nine numbers are none";
+}
+
+TEST_F(EditorPlace, AMinimisedWindowLeavesNoPlace)
+{
+    OpenEditor();
+    m_kEditor.setWindowState(Qt::WindowMinimized);
+    m_kEditor.close();
+    EXPECT_EQ(m_kPlatform.ReadSetting("DialogPos"), "");
+}
+
+} // namespace gw

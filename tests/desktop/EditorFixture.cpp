@@ -1,0 +1,161 @@
+#include "EditorFixture.h"
+
+#include "QtText.h"
+
+#include <QApplication>
+#include <QTest>
+#include <QTimer>
+
+namespace gw {
+
+void Settle()
+{
+    QApplication::processEvents();
+    QApplication::processEvents(); // what was queued meanwhile
+}
+
+EditorTest::EditorTest()
+{
+    m_kWindow.m_kOnShowEditor = [this](bool shown) { m_kEditor.SetShown(shown); };
+    m_kWindow.m_kOnRefreshEditor = [this] { m_kEditor.Refresh(); };
+    m_kWindow.m_kOnBoneOffset = [this](CBoneOffsetDialog& dialog) { return m_kEditor.RunBoneOffset(dialog); };
+}
+
+void EditorTest::OpenEditor()
+{
+    Open(Write("walk.bvh", BvhText(kPoserBones)));
+    Toggle(true);
+    ASSERT_TRUE(QTest::qWaitForWindowActive(&m_kEditor));
+    m_kWindow.TakeCalls();
+}
+
+void EditorTest::Toggle(bool shown)
+{
+    m_kWindow.m_bButtonState = shown;
+    m_kContent.ChildClick("%adv");
+    Settle();
+}
+
+void EditorTest::Type(int field, const char* text)
+{
+    auto& edit = Child<QLineEdit>(field);
+    edit.setFocus();
+    edit.selectAll();
+    QTest::keyClicks(&edit, QString::fromUtf8(text));
+}
+
+void EditorTest::Press(Qt::Key key, Qt::KeyboardModifiers modifiers)
+{
+    QTest::keyClick(QApplication::focusWidget(), key, modifiers);
+    Settle();
+}
+
+void EditorTest::Click(int button)
+{
+    QTest::mouseClick(&Child<QPushButton>(button), Qt::LeftButton);
+    Settle();
+}
+
+void EditorTest::ClickBone(int tree, const std::string& name)
+{
+    auto& view = Child<CBoneTreeView>(tree);
+    const auto found = view.findItems(ToQString(name), Qt::MatchExactly | Qt::MatchRecursive);
+    ASSERT_EQ(found.size(), 1) << name;
+    view.scrollToItem(found[0]);
+    QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, view.visualItemRect(found[0]).center());
+    Settle();
+}
+
+void EditorTest::ClickRow(int row, Qt::KeyboardModifiers modifiers)
+{
+    auto& view = Child<CMapRowView>(kMapRowList);
+    const QPoint at = view.visualRect(view.model()->index(row, 0)).center();
+    QTest::mouseClick(view.viewport(), Qt::LeftButton, modifiers, at);
+    Settle();
+}
+
+void EditorTest::DoubleClickRow(int row)
+{
+    auto& view = Child<CMapRowView>(kMapRowList);
+    const QPoint at = view.visualRect(view.model()->index(row, 0)).center();
+    QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, at);
+    QTest::mouseDClick(view.viewport(), Qt::LeftButton, {}, at);
+    Settle();
+}
+
+void EditorTest::InOffsetDialog(std::function<void(QWidget& dialog)> actions)
+{
+    QTimer::singleShot(1, &m_kEditor, [this, actions = std::move(actions)] {
+        QWidget* const dialog = QApplication::activeModalWidget();
+        if (!dialog)
+        {
+            InOffsetDialog(actions);
+            return;
+        }
+        EXPECT_TRUE(QTest::qWaitFor([=] { return QApplication::activeWindow() == dialog; }));
+        actions(*dialog);
+        EXPECT_FALSE(dialog->isVisible()) << "the person has to end it";
+        dialog->close();
+    });
+}
+
+std::string EditorTest::Field(int field) const
+{
+    return ToUtf8(Child<QLineEdit>(field).text());
+}
+
+bool EditorTest::IsEnabled(int button) const
+{
+    return Child<QPushButton>(button).isEnabled();
+}
+
+std::vector<std::string> EditorTest::Bones(int tree) const
+{
+    auto& view = Child<CBoneTreeView>(tree);
+    std::vector<std::string> names;
+    for (auto* item = view.topLevelItem(0); item; item = view.itemBelow(item))
+        names.push_back(ToUtf8(item->text(0)));
+    return names;
+}
+
+std::string EditorTest::SelectedBone(int tree) const
+{
+    const auto selected = Child<CBoneTreeView>(tree).selectedItems();
+    return selected.isEmpty() ? std::string() : ToUtf8(selected[0]->text(0));
+}
+
+std::vector<std::string> EditorTest::Rows() const
+{
+    const QAbstractItemModel& model = *Child<CMapRowView>(kMapRowList).model();
+    std::vector<std::string> rows;
+    for (int row = 0; row < model.rowCount(); ++row)
+    {
+        const auto text = [&](int column) { return ToUtf8(model.index(row, column).data().toString()); };
+        std::string all = text(kSourceColumn) + " > " + text(kTargetColumn);
+        for (int column = kRotationColumn; column < model.columnCount(); ++column)
+            all += text(column).empty() ? "" : ' ' + text(column);
+        rows.push_back(all);
+    }
+    return rows;
+}
+
+std::vector<std::string> EditorTest::TakeBoxes()
+{
+    std::vector<std::string> boxes;
+    for (const std::string& call : m_kWindow.TakeCalls())
+    {
+        if (call.starts_with("box"))
+            boxes.push_back(call);
+    }
+    return boxes;
+}
+
+std::vector<int> EditorTest::SelectedRows() const
+{
+    std::vector<int> rows;
+    for (const QModelIndex& index : Child<CMapRowView>(kMapRowList).selectionModel()->selectedRows())
+        rows.push_back(index.row());
+    return rows;
+}
+
+} // namespace gw
