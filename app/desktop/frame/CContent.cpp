@@ -125,7 +125,11 @@ std::string CContent::Notes() const
 {
     std::string text;
     for (const CReport& report : m_kReports)
-        text += (text.empty() ? "" : "\n") + ReportLine(report);
+    {
+        if (!text.empty())
+            text += '\n';
+        text += ReportLine(report);
+    }
     return text;
 }
 
