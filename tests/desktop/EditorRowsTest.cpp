@@ -83,6 +83,8 @@ TEST_F(EditorRows, AClickOnARowSelectsItsBones)
     ClickRow(7, Qt::ControlModifier);
     EXPECT_FALSE(IsEnabled(kRemoveButton)) << "a fixed row stays";
 
+    m_kEditor.resize(m_kEditor.width(), 900); // so that there is room below the rows
+    Settle();
     auto& list = Child<CMapRowView>(kMapRowList);
     QTest::mouseClick(list.viewport(), Qt::LeftButton, {},
                       list.viewport()->rect().bottomLeft() - QPoint(-5, 2));

@@ -1,6 +1,7 @@
 #include "CEditorControls.h"
 
 #include "CBoneTreeView.h"
+#include "CElidedLabel.h"
 #include "CFieldEdit.h"
 #include "CMapRowView.h"
 #include "CProfileEditorDialog.h"
@@ -53,16 +54,6 @@ QString Translated(const char* text)
     return QCoreApplication::translate("QObject", text);
 }
 
-// A label on the left and a hint on the right of one line.
-QLayout* Heading(QLabel* label, QLabel* hint)
-{
-    auto* const line = new QHBoxLayout;
-    line->addWidget(label);
-    line->addStretch();
-    line->addWidget(hint);
-    return line;
-}
-
 } // namespace
 
 CEditorControls::CEditorControls(const CGaitConvertContent& content, QWidget* window) : m_pkWindow(window)
@@ -110,30 +101,28 @@ QWidget* CEditorControls::MakeFilterLine()
 
 QLayout* CEditorControls::MakeTrees()
 {
+    m_pkSourceTree = MakeTree(kSourceTree, QObject::tr("Source Bones:"));
+    m_pkTargetTree = MakeTree(kTargetTree, QObject::tr("Kestro TK Bones:"));
     auto* const line = new QHBoxLayout;
-    line->addLayout(MakeTree(m_pkSourceTree, kSourceTree, QObject::tr("Source Bones:"), {}));
+    line->addLayout(Titled(m_pkSourceTree, nullptr));
     line->addLayout(
-        MakeTree(m_pkTargetTree, kTargetTree, QObject::tr("Kestro TK Bones:"), QObject::tr("Find: Ctrl+F")));
+        Titled(m_pkTargetTree, MakeHint(QObject::tr("Find: Ctrl+F"), QStringLiteral("findHint"))));
     return line;
 }
 
-QLayout* CEditorControls::MakeTree(CBoneTreeView*& tree, int id, const QString& title, const QString& hint)
+CBoneTreeView* CEditorControls::MakeTree(int id, const QString& title)
 {
-    tree = new CBoneTreeView(m_pkWindow);
+    auto* const tree = new CBoneTreeView(m_pkWindow);
     tree->setObjectName(Name(id));
     tree->setAccessibleName(title);
-    auto* const column = new QVBoxLayout;
-    column->addLayout(Heading(MakeLabel(title, tree), MakeHint(hint, QStringLiteral("findHint"))));
-    column->addWidget(tree);
-    return column;
+    return tree;
 }
 
 QLayout* CEditorControls::MakePairLine()
 {
-    m_pkPair = new QLabel(m_pkWindow);
+    m_pkPair = new CElidedLabel(m_pkWindow);
     m_pkPair->setObjectName(QStringLiteral("pair"));
     m_pkPair->setAccessibleName(QObject::tr("Bones to map"));
-    m_pkPair->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred); // the text takes what there is
     auto* const line = new QHBoxLayout;
     line->addWidget(m_pkPair, 1);
     line->addWidget(MakeButton(kAddToMapButton));
@@ -142,15 +131,11 @@ QLayout* CEditorControls::MakePairLine()
 
 QLayout* CEditorControls::MakeRows(const CGaitConvertContent& content)
 {
-    const QString title = QObject::tr("Bone Map List:");
     m_pkRows = new CMapRowView(content, m_pkWindow);
     m_pkRows->setObjectName(Name(kMapRowList));
-    m_pkRows->setAccessibleName(title);
-    QLabel* const hint = MakeHint(QObject::tr("Undo: Ctrl+Z    Redo: Ctrl+Y"), QStringLiteral("undoHint"));
-    auto* const column = new QVBoxLayout;
-    column->addLayout(Heading(MakeLabel(title, m_pkRows), hint));
-    column->addWidget(m_pkRows);
-    return column;
+    m_pkRows->setAccessibleName(QObject::tr("Bone Map List:"));
+    return Titled(m_pkRows,
+                  MakeHint(QObject::tr("Undo: Ctrl+Z    Redo: Ctrl+Y"), QStringLiteral("undoHint")));
 }
 
 QLayout* CEditorControls::MakeRowButtons()
@@ -195,6 +180,18 @@ QPushButton* CEditorControls::MakeButton(int id)
     button->setAutoDefault(false); // the Enter key is the fields'
     m_kButtons.push_back({id, row.enabled, button});
     return button;
+}
+
+QLayout* CEditorControls::Titled(QWidget* widget, QLabel* hint)
+{
+    auto* const heading = new QHBoxLayout;
+    heading->addWidget(MakeLabel(widget->accessibleName(), widget));
+    if (hint)
+        heading->addWidget(hint, 0, Qt::AlignRight);
+    auto* const column = new QVBoxLayout;
+    column->addLayout(heading);
+    column->addWidget(widget);
+    return column;
 }
 
 QLabel* CEditorControls::MakeLabel(const QString& text, QWidget* buddy)

@@ -11,6 +11,7 @@ class QWidget;
 namespace gw {
 
 class CBoneTreeView;
+class CElidedLabel;
 class CFieldEdit;
 class CGaitConvertContent;
 class CMapRowView;
@@ -42,20 +43,22 @@ public:
     CFieldEdit* m_pkFilter = nullptr;
     CBoneTreeView* m_pkSourceTree = nullptr;
     CBoneTreeView* m_pkTargetTree = nullptr;
-    QLabel* m_pkPair = nullptr; ///< what Add to Map would map
+    CElidedLabel* m_pkPair = nullptr; ///< what Add to Map would map
     CMapRowView* m_pkRows = nullptr;
 
 private:
     QLayout* MakeFields();
     QWidget* MakeFilterLine();
     QLayout* MakeTrees();
-    QLayout* MakeTree(CBoneTreeView*& tree, int id, const QString& title, const QString& hint);
+    CBoneTreeView* MakeTree(int id, const QString& title);
     QLayout* MakePairLine();
     QLayout* MakeRows(const CGaitConvertContent& content);
     QLayout* MakeRowButtons();
     void MakeUnusedControls();
     CFieldEdit* MakeField(int id, const QString& name);
     QPushButton* MakeButton(int id);
+    /// A list under its name, with a hint on the right of it or null.
+    QLayout* Titled(QWidget* widget, QLabel* hint);
     QLabel* MakeLabel(const QString& text, QWidget* buddy);
     QLabel* MakeHint(const QString& text, const QString& name);
 

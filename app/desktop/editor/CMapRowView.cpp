@@ -88,11 +88,13 @@ void CMapRowView::selectionChanged(const QItemSelection& selected, const QItemSe
     TellSelection(selected, true);
 }
 
+// Whoever drags over rows and out of the list has clicked on the last of them.
 void CMapRowView::mouseReleaseEvent(QMouseEvent* event)
 {
     QTableView::mouseReleaseEvent(event);
+    const QPoint at = event->position().toPoint();
     if (event->button() == Qt::LeftButton)
-        m_kCallbacks.m_kClick(indexAt(event->position().toPoint()).row());
+        m_kCallbacks.m_kClick((viewport()->rect().contains(at) ? indexAt(at) : currentIndex()).row());
 }
 
 void CMapRowView::mouseDoubleClickEvent(QMouseEvent* event)

@@ -2,6 +2,7 @@
 
 #include "CBoneOffsetWindow.h"
 #include "CBoneTreeView.h"
+#include "CElidedLabel.h"
 #include "CFieldEdit.h"
 #include "CGaitConvertContent.h"
 #include "CMapRowView.h"
@@ -9,8 +10,8 @@
 #include "DialogPlace.h"
 #include "QtText.h"
 
+#include <QGuiApplication>
 #include <QKeyEvent>
-#include <QLabel>
 #include <QPushButton>
 #include <QShortcut>
 #include <QTimer>
@@ -21,7 +22,7 @@ namespace gw {
 namespace {
 
 // The size that a stored place must have to be used again; a larger font makes the window larger.
-constexpr QSize kTemplateSize(720, 680);
+constexpr QSize kTemplateSize(720, 640);
 
 } // namespace
 
@@ -102,6 +103,18 @@ void CProfileEditorWindow::LeaveField()
         return;
     Model().LeaveField();
     m_bLeavingField = false;
+    QTimer::singleShot(0, this, [this] { ReleaseButtons(); });
+}
+
+// A press on a button makes a field lose the focus. Where that shows a message box, the box gets the release,
+// and the button would stay down.
+void CProfileEditorWindow::ReleaseButtons()
+{
+    for (const CEditorControls::Button& button : m_kControls.m_kButtons)
+    {
+        if (QGuiApplication::mouseButtons() == Qt::NoButton)
+            button.button->setDown(false);
+    }
 }
 
 void CProfileEditorWindow::OpenFilter()
@@ -165,12 +178,6 @@ void CProfileEditorWindow::keyPressEvent(QKeyEvent* event)
         QDialog::keyPressEvent(event);
 }
 
-void CProfileEditorWindow::resizeEvent(QResizeEvent* event)
-{
-    QDialog::resizeEvent(event);
-    Refresh();
-}
-
 bool CProfileEditorWindow::RunBoneOffset(CBoneOffsetDialog& dialog)
 {
     CBoneOffsetWindow window(m_kContent, dialog, isVisible() ? this : parentWidget());
@@ -220,9 +227,7 @@ void CProfileEditorWindow::ShowPair()
     const bool both = !source.isEmpty() && !target.isEmpty();
     const QString text =
         both ? source + QStringLiteral(" \u2192 ") + target : tr("Select a bone on each side.");
-    QLabel* const pair = m_kControls.m_pkPair;
-    pair->setText(pair->fontMetrics().elidedText(text, Qt::ElideMiddle, pair->width()));
-    pair->setToolTip(text);
+    m_kControls.m_pkPair->ShowText(text);
 }
 
 } // namespace gw

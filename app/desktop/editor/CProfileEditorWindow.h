@@ -33,7 +33,6 @@ public:
 
 protected:
     void keyPressEvent(QKeyEvent* event) override;
-    void resizeEvent(QResizeEvent* event) override;
 
 private:
     void ConnectFields();
@@ -43,6 +42,7 @@ private:
     void AddShortcuts();
     CProfileEditorDialog& Model() const;
     void LeaveField();
+    void ReleaseButtons();
     void OpenFilter();
     void CloseFilter();
     void RestorePlace();
