@@ -206,7 +206,7 @@ QLabel* CEditorControls::MakeHint(const QString& text, const QString& name)
 {
     auto* const hint = new QLabel(text, m_pkWindow);
     hint->setObjectName(name);
-    hint->setEnabled(false); // said quietly
+    hint->setProperty("kind", QStringLiteral("caption")); // the style says it quietly
     return hint;
 }
 
