@@ -6,6 +6,7 @@
 
 #include <QApplication>
 #include <QComboBox>
+#include <QFocusEvent>
 #include <QScreen>
 #include <QTest>
 #include <filesystem>
@@ -77,6 +78,15 @@ TEST_F(EditorFields, AMessageThatTakesTheFocusIsShownOnce)
     Type(kNameField, "mine");
     Child<QLineEdit>(kFrameRateField).setFocus();
     EXPECT_THAT(TakeBoxes(), ElementsAre("box 158"));
+}
+
+TEST_F(EditorFields, AMenuOverAFieldTakesNothingAway)
+{
+    Type(kNameField, "mine");
+    QFocusEvent menu(QEvent::FocusOut, Qt::PopupFocusReason);
+    QApplication::sendEvent(&Child<QLineEdit>(kNameField), &menu);
+    EXPECT_THAT(TakeBoxes(), IsEmpty());
+    EXPECT_EQ(Field(kNameField), "mine") << "still being typed";
 }
 
 TEST_F(EditorFields, UndoTakesBackTypingInAFieldAndCommandsOutsideIt)

@@ -149,6 +149,11 @@ TEST_F(EditorRows, TreesStayAsTheyAreWhileOnlyMarkersChange)
     EXPECT_EQ(tree.topLevelItem(0), hip) << "not built anew";
     EXPECT_EQ(Bones(kSourceTree), folded);
     EXPECT_NE(tree.topLevelItem(0)->child(0)->child(0)->icon(0).cacheKey(), mapped);
+
+    Press(Qt::Key_F, Qt::ControlModifier);
+    Press(Qt::Key_S);
+    Press(Qt::Key_Escape);
+    EXPECT_EQ(Bones(kSourceTree), folded) << "also behind a filter";
 }
 
 TEST_F(EditorRows, AnotherSourceFillsTheTreeAnew)
@@ -200,6 +205,28 @@ TEST_F(EditorRows, TheFilterShowsWhatIsStillToBeMappedFirst)
     EXPECT_FALSE(Child<QWidget>(QStringLiteral("filterLine")).isVisible());
     EXPECT_EQ(Bones(kSourceTree).size(), 7u);
     EXPECT_EQ(SelectedBone(kTargetTree), "RThigh");
+}
+
+TEST_F(EditorRows, AFilteredListStaysWhileItsBonesAreMapped)
+{
+    std::string text = "HIERARCHY\nROOT hip\n{\nOFFSET 0 0 0\nCHANNELS 3 Zrotation Xrotation Yrotation\n";
+    for (int bone = 0; bone < 100; ++bone)
+        text.append("JOINT b")
+            .append(std::to_string(bone))
+            .append("\n{\nOFFSET 0 1 0\nCHANNELS 0\nEnd Site\n"
+                    "{\nOFFSET 0 1 0\n}\n}\n");
+    Open(Write("many.bvh", text + "}\nMOTION\nFrames: 1\nFrame Time: 0.03\n0 0 0\n"));
+    Settle();
+    ClickBone(kTargetTree, "Waist");
+    Press(Qt::Key_F, Qt::ControlModifier);
+    Press(Qt::Key_B);
+    QScrollBar& bar = *Child<CBoneTreeView>(kSourceTree).verticalScrollBar();
+    bar.setValue(40);
+    ClickBone(kSourceTree, "b42");
+    Click(kAddToMapButton);
+    EXPECT_EQ(Rows().back(), "b42 > Waist 0 0 0");
+    EXPECT_EQ(Bones(kSourceTree).back(), "b42") << "the mapped ones stand last";
+    EXPECT_EQ(bar.value(), 40) << "and the next ones under the mouse";
 }
 
 TEST_F(EditorRows, ASelectionOutlivesTheFilterThatHidesIt)

@@ -1,0 +1,92 @@
+// A list that only hears of changes shows what the table holds.
+#include "CMapRowModel.h"
+
+#include <QAbstractItemModelTester>
+#include <gtest/gtest.h>
+#include <random>
+
+namespace gw {
+
+namespace {
+
+/// Holds a model's rows as a view would: by the changes alone.
+class CMirror
+{
+public:
+    explicit CMirror(const CMapRowModel& model) : m_kModel(model)
+    {
+        QObject::connect(&model, &QAbstractItemModel::rowsInserted, &model,
+                         [this](const QModelIndex&, int first, int last) {
+                             m_kRows.insert(m_kRows.begin() + first, size_t(last - first + 1), {});
+                             Take(first, last);
+                         });
+        QObject::connect(&model, &QAbstractItemModel::rowsRemoved, &model,
+                         [this](const QModelIndex&, int first, int last) {
+                             m_kRows.erase(m_kRows.begin() + first, m_kRows.begin() + last + 1);
+                         });
+        QObject::connect(
+            &model, &QAbstractItemModel::dataChanged, &model,
+            [this](const QModelIndex& first, const QModelIndex& last) { Take(first.row(), last.row()); });
+    }
+
+    const std::vector<std::string>& Rows() const { return m_kRows; }
+
+private:
+    void Take(int first, int last)
+    {
+        for (int row = first; row <= last; ++row)
+        {
+            std::string text;
+            for (int column = 0; column < kMapColumnCount; ++column)
+                text += m_kModel.index(row, column).data().toString().toStdString() + '|';
+            m_kRows[size_t(row)] = text;
+        }
+    }
+
+    const CMapRowModel& m_kModel;
+    std::vector<std::string> m_kRows;
+};
+
+std::vector<std::string> RowsOf(const CMapRowTable& table)
+{
+    std::vector<std::string> rows;
+    for (int row = 0; row < table.RowCount(); ++row)
+    {
+        std::string text;
+        for (int column = 0; column < kMapColumnCount; ++column)
+            text += table.Text(row, column) + '|';
+        rows.push_back(text);
+    }
+    return rows;
+}
+
+} // namespace
+
+TEST(EditorRowModel, EveryChangeIsTold)
+{
+    CMapRowModel model({}, nullptr);
+    const QAbstractItemModelTester tester(&model, QAbstractItemModelTester::FailureReportingMode::Fatal);
+    const CMirror mirror(model);
+    CMapRowTable table;
+    std::mt19937 random(7); // the same changes on every run
+    const auto below = [&](int end) { return static_cast<int>(random() % static_cast<unsigned>(end)); };
+    for (int step = 0; step < 500; ++step)
+    {
+        for (int change = below(4); change >= 0; --change)
+        {
+            CRowNumbers numbers;
+            numbers.rotation[1] = below(3);
+            if (below(3) == 0)
+                table.RemoveRow(below(20));
+            else
+                table.AddRow("s", std::string("t").append(std::to_string(below(20))), numbers,
+                             ERowColumns::All);
+        }
+        if (below(50) == 0)
+            table.Clear();
+        model.ShowRows(table);
+        ASSERT_EQ(mirror.Rows(), RowsOf(table)) << "step " << step;
+    }
+}
+
+} // namespace gw
