@@ -7,8 +7,8 @@
 #include "CGaitConvertContent.h"
 #include "CMapRowView.h"
 #include "CProfileEditorDialog.h"
-#include "DialogPlace.h"
 #include "QtText.h"
+#include "WindowPlace.h"
 
 #include <QGuiApplication>
 #include <QKeyEvent>
@@ -21,6 +21,7 @@ namespace gw {
 
 namespace {
 
+constexpr const char* kPlaceSetting = "DialogPos";
 // The size that a stored place must have to be used again; a larger font makes the window larger.
 constexpr QSize kTemplateSize(720, 640);
 
@@ -150,7 +151,7 @@ void CProfileEditorWindow::RestorePlace()
     if (std::exchange(m_bPlaced, true))
         return;
     resize(kTemplateSize.expandedTo(minimumSizeHint()));
-    if (const auto place = ReadDialogPlace(m_kPlatform, size()))
+    if (const auto place = ReadWindowPlace(m_kPlatform, kPlaceSetting, size()))
         move(*place);
 }
 
@@ -159,7 +160,7 @@ void CProfileEditorWindow::Hide()
     if (!isVisible())
         return;
     hide();
-    WriteDialogPlace(m_kPlatform, *this);
+    WriteWindowPlace(m_kPlatform, kPlaceSetting, *this);
 }
 
 void CProfileEditorWindow::reject()

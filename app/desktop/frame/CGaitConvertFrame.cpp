@@ -8,7 +8,7 @@
 #include "CornerMenu.h"
 #include "QtText.h"
 #include "StringTable.h"
-#include "WindowPlacement.h"
+#include "WindowPlace.h"
 
 #include <QAbstractButton>
 #include <QApplication>
@@ -31,7 +31,6 @@ namespace {
 constexpr const char* kPlaceSetting = "WindowPos";
 constexpr int kMenuMilliseconds = 5;
 constexpr int kRetryMilliseconds = 200;
-constexpr int kHeadOnScreen = 40; // pixels of the title that must be where a mouse can reach them
 
 // Keys that click a child.
 struct Key
@@ -50,11 +49,6 @@ constexpr Key kKeys[] = {
     {Qt::Key_Right,             "fend"   },
     {Qt::Key_F1,                "help"   },
 };
-
-bool IsReachable(const QPoint& place)
-{
-    return QGuiApplication::screenAt(place + QPoint(kHeadOnScreen, kHeadOnScreen / 2)) != nullptr;
-}
 
 std::string DroppedPath(const QMimeData& dropped)
 {
@@ -101,25 +95,10 @@ CGaitConvertFrame::~CGaitConvertFrame()
 void CGaitConvertFrame::Place(const QSize& size)
 {
     setFixedSize(size);
-    WindowPlacement stored;
-    if (ScanPlacement(m_kPlatform.ReadSetting(kPlaceSetting), stored) &&
-        IsReachable({stored.left, stored.top}))
-        move(stored.left, stored.top);
+    if (const auto place = ReadWindowPlace(m_kPlatform, kPlaceSetting))
+        move(*place);
     else if (const QScreen* screen = QGuiApplication::primaryScreen())
         move(screen->availableGeometry().center() - rect().center());
-}
-
-void CGaitConvertFrame::StorePlace()
-{
-    if (isMinimized() || isMaximized())
-        return;
-    WindowPlacement placement;
-    placement.minimisedX = placement.minimisedY = placement.maximisedX = placement.maximisedY = -1;
-    placement.left = x();
-    placement.top = y();
-    placement.right = x() + width();
-    placement.bottom = y() + height();
-    m_kPlatform.WriteSetting(kPlaceSetting, PlacementText(placement));
 }
 
 void CGaitConvertFrame::AddShortcuts()
@@ -160,12 +139,14 @@ void CGaitConvertFrame::RaiseAndOpen(const std::string& path)
 
 void CGaitConvertFrame::closeEvent(QCloseEvent* event)
 {
+    if (QWidget* field = QApplication::focusWidget())
+        field->clearFocus(); // what is being typed counts
     if (m_pkFace->IsBusy() || !m_spContent->MayClose())
     {
         event->ignore();
         return;
     }
-    StorePlace();
+    WriteWindowPlace(m_kPlatform, kPlaceSetting, *this);
     m_pkEditor->close();
     event->accept();
     QCoreApplication::quit();

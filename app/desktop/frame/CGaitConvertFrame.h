@@ -42,7 +42,6 @@ protected:
 
 private:
     void Place(const QSize& size);
-    void StorePlace();
     void AddShortcuts();
     void BeginMove(const QPoint& globalPosition);
     void OpenCornerMenu(const QPoint& globalPosition);
