@@ -3,10 +3,12 @@
 #include "CLeftKeys.h"
 #include "GLPainter.h"
 
+#include <QGuiApplication>
 #include <QMouseEvent>
 #include <QOpenGLContext>
 #include <QPointer>
 #include <QSurfaceFormat>
+#include <algorithm>
 
 namespace gw {
 
@@ -80,10 +82,16 @@ void CPreviewWidget::mouseMoveEvent(QMouseEvent* event)
                             {m_kKeys.IsDown(EKey::LeftCtrl), m_kKeys.IsDown(EKey::LeftShift)});
 }
 
+// The toolkit's screens that mix no GL into a window may give a context all the same, and crash in the
+// widget.
 bool HasOpenGL()
 {
+    constexpr const char* kScreensWithoutViews[] = {"offscreen", "minimal", "linuxfb", "vnc"};
+    const auto isScreen = [](const char* name) {
+        return QGuiApplication::platformName() == QLatin1String(name);
+    };
     QOpenGLContext context;
-    return context.create();
+    return std::ranges::none_of(kScreensWithoutViews, isScreen) && context.create();
 }
 
 void RequestPreviewFormat()
