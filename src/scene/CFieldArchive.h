@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CFailure.h"
 #include "CText.h"
 #include "CVersion.h"
 #include "Mat4.h"
@@ -184,7 +185,7 @@ public:
     {
         const bool present = Presence(name, !values.empty());
         if (IsReading() && present && count < 0)
-            Refuse();
+            Refuse(EFailure::BadCount);
         if (IsReading())
             values.resize(present ? Fitting(count, sizeof(T)) : 0);
         if (present)
@@ -203,8 +204,8 @@ public:
     /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is
     /// none.
     virtual size_t Fitting(int64_t count, size_t elementBytes);
-    /// Marks a read as damaged here; fields that follow read as zeros.
-    virtual void Refuse() {}
+    /// Ends a read here, as damaged or for want of room; fields that follow read as zeros.
+    virtual void Refuse(EFailure) {}
 
 protected:
     CFieldArchive(bool reading, CVersion version) : m_kVersion(version), m_bReading(reading) {}

@@ -9,11 +9,6 @@ void CFieldReader::Fail(EFailure reason)
     m_kRecord.Fail(reason, m_uiPosition, m_pcClassName);
 }
 
-void CFieldReader::Refuse()
-{
-    Fail(EFailure::BadCount);
-}
-
 void CFieldReader::BeginObject(std::vector<uint32_t>& linkIDs, const char* className)
 {
     m_pkLinkIDs = &linkIDs;

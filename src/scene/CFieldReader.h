@@ -24,7 +24,7 @@ public:
     bool Presence(const char* name, bool present) override;
     size_t Count(const char* name, size_t count, size_t leastBytes) override;
     size_t Fitting(int64_t count, size_t elementBytes) override;
-    void Refuse() override;
+    void Refuse(EFailure reason) override { Fail(reason); }
 
     /// A length and its characters, as a view into the bytes.
     std::string_view ReadString();
