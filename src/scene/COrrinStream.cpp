@@ -128,6 +128,7 @@ void COrrinStream::SetBaseDirectory(const std::string& path)
 {
     const size_t separator = path.find_last_of("/\\");
     m_kBaseDirectory = separator == std::string::npos ? "" : path.substr(0, separator);
+    m_bHasBaseDirectory = true;
 }
 
 bool COrrinStream::LoadFile(const std::string& path, bool thumbnailOnly)
@@ -246,6 +247,13 @@ CLinkRecord& COrrinStream::NewLinkRecord(CObject& object)
     return record;
 }
 
+void COrrinStream::Substitute(CLinkRecord& record, CObject& object)
+{
+    record.m_kLinkID.clear();
+    record.m_bSubstitute = true;
+    record.m_spkObject = &object;
+}
+
 void COrrinStream::ReadObject(CObject& object, CLinkRecord& record)
 {
     m_pkReader->BeginObject(record.m_kLinkID, object.GetRTTI()->m_pcName);
@@ -289,7 +297,10 @@ bool COrrinStream::CheckGraph()
 void COrrinStream::DropGraph()
 {
     for (const auto& record : m_kRecords)
-        Unlink(*record->m_spkObject);
+    {
+        if (!record->m_bSubstitute)
+            Unlink(*record->m_spkObject);
+    }
     RemoveAllRoots();
 }
 

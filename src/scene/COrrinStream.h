@@ -26,6 +26,7 @@ struct CLinkRecord
 {
     uint32_t m_uiCursor = 0;  ///< next id to resolve
     Ref<CObject> m_spkObject; ///< kept alive until the links stand
+    bool m_bSubstitute = false; ///< an object that was there before stands for the one in the file
     std::vector<uint32_t> m_kLinkID;
 };
 
@@ -69,6 +70,8 @@ public:
     COrrinThumbnail& Thumbnail() { return m_kThumbnail; }
     /// The folder of the file last read or written, without the last separator.
     const std::string& GetBaseDirectory() const { return m_kBaseDirectory; }
+    /// False for a stream that has seen no file but only memory: names in it lead nowhere.
+    bool HasBaseDirectory() const { return m_bHasBaseDirectory; }
     /// What the last load or save failed on, with the byte and the class.
     const CFailureRecord& Record() const { return m_kRecord; }
 
@@ -89,6 +92,9 @@ public:
     CObject* FindLinkedObject(uint32_t id) const;
     /// The id that an object has in the file being written; 0 for null and for what is not written.
     uint32_t LinkID(const CObject* object) const;
+    /// Lets an object that is there already take the place of the one that the record was made for, which
+    /// lives no longer than that. What the other holds stays as it is.
+    void Substitute(CLinkRecord& record, CObject& object);
     /// A fresh record for an object that is about to read itself; the stream owns it.
     CLinkRecord& NewLinkRecord(CObject& object);
 
@@ -114,6 +120,7 @@ private:
     std::vector<CObject*> m_kSaveList;
     std::unordered_map<const CObject*, uint32_t> m_kSaveID;
     std::string m_kBaseDirectory;
+    bool m_bHasBaseDirectory = false;
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing
     CFailureRecord m_kRecord;
@@ -124,8 +131,9 @@ template <class T>
 CObject* MakeObject(COrrinStream& stream)
 {
     CObject* object = new T;
-    object->Load(stream, stream.NewLinkRecord(*object));
-    return object;
+    CLinkRecord& record = stream.NewLinkRecord(*object);
+    object->Load(stream, record);
+    return record.m_spkObject.Get();
 }
 
 } // namespace gw
