@@ -1,8 +1,16 @@
 #include "CFieldReader.h"
 
+#include "CMappedFile.h"
+
 #include <cstring>
 
 namespace gw {
+
+namespace {
+
+constexpr size_t kForgetBytes = size_t{16} << 20; // seldom enough to cost nothing
+
+} // namespace
 
 void CFieldReader::Fail(EFailure reason)
 {
@@ -57,6 +65,20 @@ size_t CFieldReader::Fitting(int64_t count, size_t elementBytes)
     return static_cast<size_t>(count);
 }
 
+void CFieldReader::Copy(std::byte* to, size_t byteCount)
+{
+    while (byteCount > 0)
+    {
+        const size_t piece = std::min(byteCount, kForgetBytes);
+        std::memcpy(to, m_kBytes.data() + m_uiPosition, piece);
+        to += piece;
+        m_uiPosition += piece;
+        byteCount -= piece;
+        if (m_pkFile && m_uiPosition - m_uiForgotten >= kForgetBytes)
+            m_pkFile->Forget(m_uiForgotten = m_uiPosition);
+    }
+}
+
 void CFieldReader::Values(const char*, EFieldKind kind, void* values, size_t count)
 {
     const size_t byteCount = count * FieldBytes(kind);
@@ -70,10 +92,9 @@ void CFieldReader::Values(const char*, EFieldKind kind, void* values, size_t cou
         return;
     }
     if (kind == EFieldKind::Bool)
-        *static_cast<bool*>(values) = m_kBytes[m_uiPosition] != std::byte{0};
+        *static_cast<bool*>(values) = m_kBytes[m_uiPosition++] != std::byte{0};
     else
-        std::memcpy(values, m_kBytes.data() + m_uiPosition, byteCount);
-    m_uiPosition += byteCount;
+        Copy(static_cast<std::byte*>(values), byteCount);
 }
 
 void CFieldReader::Slot(const char*, const CLinkSlot&)

@@ -9,6 +9,8 @@
 
 namespace gw {
 
+class CMappedFile;
+
 /// Fills fields from the bytes of a container, and trusts none of them: what does not fit into the bytes that
 /// remain is damage, and from there on every field reads as zero.
 class CFieldReader : public CFieldArchive
@@ -33,6 +35,9 @@ public:
     size_t Position() const { return m_uiPosition; }
     bool AtEnd() const { return m_uiPosition >= m_kBytes.size(); }
     bool IsDamaged() const { return static_cast<bool>(m_kRecord.Failure()); }
+    /// The file that the bytes are mapped from. Its pages are given back as they are used up, so that a large
+    /// block does not stand in memory twice.
+    void SetSource(CMappedFile* file) { m_pkFile = file; }
     /// Where link ids go, and the class whose fields are read, for the failure record.
     void BeginObject(std::vector<uint32_t>& linkIDs, const char* className);
 
@@ -43,12 +48,15 @@ protected:
 private:
     size_t Remaining() const { return m_kBytes.size() - m_uiPosition; }
     void Fail(EFailure reason);
+    void Copy(std::byte* to, size_t byteCount);
 
     std::span<const std::byte> m_kBytes;
     size_t m_uiPosition;
     CFailureRecord& m_kRecord;
     std::vector<uint32_t>* m_pkLinkIDs = nullptr;
     const char* m_pcClassName = "";
+    CMappedFile* m_pkFile = nullptr;
+    size_t m_uiForgotten = 0;
 };
 
 } // namespace gw

@@ -153,7 +153,11 @@ bool COrrinStream::LoadFile(const std::string& path, bool thumbnailOnly)
     if (thumbnailOnly)
         LoadThumbnailOnly(bytes, kHeader.size());
     else
+    {
+        m_pkFile = &file;
         LoadBuffer(bytes, kHeader.size());
+        m_pkFile = nullptr;
+    }
     return true;
 }
 
@@ -179,6 +183,7 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
     m_kThumbnail = {};
     m_kThumbnail.Fields(reader);
 
+    reader.SetSource(m_pkFile);
     m_pkReader = &reader;
     const bool whole = ReadObjects();
     m_pkReader = nullptr;

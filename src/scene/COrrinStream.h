@@ -20,12 +20,13 @@ namespace gw {
 
 class CFieldReader;
 class CFieldWriter;
+class CMappedFile;
 
 /// What an object left behind while a file is loading: the link ids that it read, in its own order.
 struct CLinkRecord
 {
-    uint32_t m_uiCursor = 0;  ///< next id to resolve
-    Ref<CObject> m_spkObject; ///< kept alive until the links stand
+    uint32_t m_uiCursor = 0;    ///< next id to resolve
+    Ref<CObject> m_spkObject;   ///< kept alive until the links stand
     bool m_bSubstitute = false; ///< an object that was there before stands for the one in the file
     std::vector<uint32_t> m_kLinkID;
 };
@@ -121,6 +122,7 @@ private:
     std::unordered_map<const CObject*, uint32_t> m_kSaveID;
     std::string m_kBaseDirectory;
     bool m_bHasBaseDirectory = false;
+    CMappedFile* m_pkFile = nullptr;    // while reading one
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing
     CFailureRecord m_kRecord;
