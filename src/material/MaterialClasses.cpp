@@ -1,12 +1,32 @@
+#include "CAnmImage.h"
+#include "CBlendMaterial.h"
 #include "CFactoryMap.h"
+#include "CImage.h"
 #include "CMaterialBase.h"
+#include "CMultiMaterial.h"
+#include "CNormalBumpTex.h"
+#include "COrrinStream.h"
+#include "CSprite.h"
+#include "CStandardMaterial.h"
+#include "CTextureMap.h"
 
 namespace gw {
 namespace {
 
 constexpr CFactoryRow kClasses[] = {
-    {&CMaterialBase::ms_kRTTI, MakeNothing},
-    {&CMaterial::ms_kRTTI,     MakeNothing},
+    {&CMaterialBase::ms_kRTTI,     MakeNothing                  },
+    {&CMaterial::ms_kRTTI,         MakeNothing                  },
+    {&CStandardMaterial::ms_kRTTI, MakeObject<CStandardMaterial>},
+    {&CBlendMaterial::ms_kRTTI,    MakeObject<CBlendMaterial>   },
+    {&CMultiMaterial::ms_kRTTI,    MakeObject<CMultiMaterial>   },
+    {&CTexture::ms_kRTTI,          MakeNothing                  },
+    {&CTextureMap::ms_kRTTI,       MakeObject<CTextureMap>      },
+    {&CBlendTex::ms_kRTTI,         MakeNothing                  },
+    {&CMultiTex::ms_kRTTI,         MakeNothing                  },
+    {&CImage::ms_kRTTI,            MakeObject<CImage>           },
+    {&CAnmImage::ms_kRTTI,         MakeObject<CAnmImage>        },
+    {&CSprite::ms_kRTTI,           MakeObject<CSprite>          },
+    {&CNormalBumpTex::ms_kRTTI,    MakeObject<CNormalBumpTex>   },
 };
 
 } // namespace

@@ -1,0 +1,28 @@
+#pragma once
+
+#include "CMaterialBase.h"
+
+#include <array>
+
+namespace gw {
+
+/// Two materials that a mask blends.
+class CBlendMaterial : public CMaterial
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    CBlendMaterial();
+    CBlendMaterial(const CBlendMaterial& source);
+    ~CBlendMaterial() override;
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    CObject* CreateClone() const override;
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+
+    float m_fBlend = 0.0f;
+    Held<CMaterialBase> m_spkMask;
+    std::array<Held<CMaterialBase>, 2> m_aspkMtl; ///< may be the same one, and null
+};
+
+} // namespace gw

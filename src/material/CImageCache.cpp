@@ -1,0 +1,31 @@
+#include "CImageCache.h"
+
+namespace gw {
+
+namespace {
+
+// Built before main, so that it outlives every image that is made later.
+[[maybe_unused]] const CImageCache& kBuiltAtStart = CImageCache::Instance();
+
+} // namespace
+
+CImageCache& CImageCache::Instance()
+{
+    static CImageCache cache;
+    return cache;
+}
+
+void CImageCache::Remove(std::string_view path, const CObject* image)
+{
+    const auto [first, last] = m_kImages.equal_range(path);
+    for (auto entry = first; entry != last;)
+        entry = entry->second == image ? m_kImages.erase(entry) : std::next(entry);
+}
+
+void CImageCache::RemoveAll(std::string_view path)
+{
+    const auto [first, last] = m_kImages.equal_range(path);
+    m_kImages.erase(first, last);
+}
+
+} // namespace gw

@@ -1,0 +1,100 @@
+#include "CTempFile.h"
+
+#include "Paths.h"
+
+#include <cerrno>
+
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <sys/stat.h>
+#include <unistd.h>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kNamePattern = "TK_XXXXXX.tmp";
+constexpr int kExtensionLength = 4;
+
+// Everybody on a machine may share the folder, as they share the one that it lies in.
+void MakeSharedFolder(const std::string& folder)
+{
+    if (!FolderExists(folder) && CreateFolder(folder))
+        chmod(folder.c_str(), 01777);
+}
+
+// Another program may remove the empty folder just before a file is made in it.
+int CreateIn(const std::string& folder, std::string& path)
+{
+    constexpr int kAttempts = 8;
+    for (int i = 0; i < kAttempts; ++i)
+    {
+        MakeSharedFolder(folder);
+        path = folder + std::string(kNamePattern);
+        const int file = mkostemps(path.data(), kExtensionLength, O_CLOEXEC);
+        if (file >= 0)
+            return file;
+        if (errno != ENOENT)
+            break;
+    }
+    path.clear();
+    return -1;
+}
+
+} // namespace
+
+CTempFile::CTempFile(const std::string& folder, uint64_t byteCount, bool takesBlocks)
+    : m_uiSize(byteCount), m_iFile(CreateIn(folder, m_kPath)), m_bTakesBlocks(takesBlocks)
+{
+    if (m_iFile < 0 || ftruncate(m_iFile, static_cast<off_t>(byteCount)) == 0)
+        return;
+    close(m_iFile);
+    m_iFile = -1;
+}
+
+CTempFile::~CTempFile()
+{
+    if (m_iFile >= 0)
+        close(m_iFile);
+    if (!m_kPath.empty())
+        unlink(m_kPath.c_str());
+}
+
+bool CTempFile::Reserve(const View& view)
+{
+    int error = EINTR;
+    while (error == EINTR)
+        error =
+            posix_fallocate(m_iFile, static_cast<off_t>(view.m_uiOffset), static_cast<off_t>(view.m_uiSize));
+    return error == 0;
+}
+
+std::byte* CTempFile::Use(View& view)
+{
+    if (!view.m_pkAddress)
+    {
+        void* const mapped = mmap(nullptr, view.m_uiSize, PROT_READ | PROT_WRITE, MAP_SHARED, m_iFile,
+                                  static_cast<off_t>(view.m_uiOffset));
+        if (mapped == MAP_FAILED)
+            return nullptr;
+        view.m_pkAddress = static_cast<std::byte*>(mapped);
+    }
+    ++view.m_iUses;
+    return view.m_pkAddress;
+}
+
+void CTempFile::Drop(View& view)
+{
+    if (view.m_iUses > 0 && --view.m_iUses == 0)
+        Close(view);
+}
+
+void CTempFile::Close(View& view)
+{
+    if (view.m_pkAddress)
+        munmap(view.m_pkAddress, view.m_uiSize);
+    view.m_pkAddress = nullptr;
+    view.m_iUses = 0;
+}
+
+} // namespace gw

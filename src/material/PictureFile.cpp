@@ -1,0 +1,181 @@
+#include "PictureFile.h"
+
+#include "CMappedFile.h"
+#include "CPixelBuffer.h"
+#include "CSafeFile.h"
+#include "Paths.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <cstring>
+#include <optional>
+
+#include <dlfcn.h>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kCodecModule = "gw_picture_codec.so";
+
+// The formats that pictures may have: names that a file holds must not choose among all that the picture
+// library knows, since some of those run commands.
+struct CExtensionRow
+{
+    const char* extension;
+    const char* format;
+};
+constexpr CExtensionRow kExtensions[] = {
+    {"bmp",  "BMP" },
+    {"dib",  "BMP" },
+    {"gif",  "GIF" },
+    {"jpg",  "JPEG"},
+    {"jpeg", "JPEG"},
+    {"jpe",  "JPEG"},
+    {"png",  "PNG" },
+    {"tga",  "TGA" },
+    {"tif",  "TIFF"},
+    {"tiff", "TIFF"},
+    {"pcx",  "PCX" },
+    {"dds",  "DDS" },
+    {"psd",  "PSD" },
+    {"pbm",  "PBM" },
+    {"pgm",  "PGM" },
+    {"ppm",  "PPM" },
+    {"pnm",  "PNM" },
+};
+
+// What files of a format begin with, for pictures whose name does not tell what they are.
+struct CBeginningRow
+{
+    std::string_view beginning;
+    const char* format;
+};
+constexpr CBeginningRow kBeginnings[] = {
+    {"BM",                     "BMP" },
+    {"GIF8",                   "GIF" },
+    {"\xff\xd8\xff",           "JPEG"},
+    {"\x89PNG\r\n",            "PNG" },
+    {std::string_view("II*\0", 4),     "TIFF"},
+    {std::string_view("MM\0*",                        4),       "TIFF"},
+    {"DDS ",                  "DDS"                 },
+    {"8BPS",  "PSD"},
+};
+
+const char* FormatOfExtension(std::string_view extension)
+{
+    const auto row = std::ranges::find_if(
+        kExtensions, [&](const CExtensionRow& known) { return EqualNoCase(known.extension, extension); });
+    return row == std::end(kExtensions) ? nullptr : row->format;
+}
+
+std::string_view ExtensionOf(const CPathParts& parts)
+{
+    return std::string_view(parts.extension).substr(parts.extension.empty() ? 0 : 1);
+}
+
+const char* FormatOf(const std::string& path, std::string_view file)
+{
+    const auto row = std::ranges::find_if(
+        kBeginnings, [&](const CBeginningRow& known) { return file.starts_with(known.beginning); });
+    return row == std::end(kBeginnings) ? FormatOfExtension(ExtensionOf(SplitPath(path))) : row->format;
+}
+
+CPictureCodec* OpenCodec()
+{
+    void* const module = dlopen((ExecutableFolder() + kCodecModule).c_str(), RTLD_NOW | RTLD_LOCAL);
+    void* const entry = module ? dlsym(module, kPictureCodecEntry) : nullptr;
+    return entry ? reinterpret_cast<CPictureCodecEntry>(entry)() : nullptr;
+}
+
+bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame, const CFrameTaker& take)
+{
+    CPictureCodec* codec = format ? LoadPictureCodec() : nullptr;
+    std::optional<CPixelLock> lock;
+    const auto place = [&](const CPictureHead& head) -> uint8_t* {
+        lock.reset();
+        CPixelBuffer& pixels = take(head);
+        if (!pixels.SetRowAlignment(false) || !pixels.Create(head.width, head.height, 0))
+            return nullptr;
+        if (head.horizontalResolution > 0 && head.verticalResolution > 0)
+            pixels.SetResolution(head.horizontalResolution, head.verticalResolution);
+        return lock.emplace(pixels).Bytes().data();
+    };
+    return codec && codec->Decode(file, format, everyFrame, place);
+}
+
+bool DecodeOne(std::span<const std::byte> file, const char* format, CPixelBuffer& pixels)
+{
+    if (!pixels.Free())
+        return false;
+    const bool good =
+        Decode(file, format, false, [&](const CPictureHead&) -> CPixelBuffer& { return pixels; });
+    if (!good)
+        pixels.Free();
+    return good;
+}
+
+// Rows without gaps, which is how the codec wants them.
+std::vector<uint8_t> PackRows(const CPixelBuffer& pixels, const CPixelView& view)
+{
+    const size_t rowBytes =
+        static_cast<size_t>(pixels.GetWidth()) * static_cast<size_t>(pixels.GetBytesPerPixel());
+    std::vector<uint8_t> rows(rowBytes * static_cast<size_t>(pixels.GetHeight()));
+    for (int32_t y = 0; y < pixels.GetHeight(); ++y)
+        std::memcpy(rows.data() + static_cast<size_t>(y) * rowBytes, view.Row(y), rowBytes);
+    return rows;
+}
+
+} // namespace
+
+CPictureCodec* LoadPictureCodec()
+{
+    static CPictureCodec* const codec = OpenCodec();
+    return codec;
+}
+
+bool ReadPicture(const std::string& path, CPixelBuffer& pixels)
+{
+    CMappedFile file;
+    const bool isThere = file.Open(path) == EFailure::None;
+    return DecodeOne(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, pixels);
+}
+
+bool ReadFrames(const std::string& path, const CFrameTaker& take)
+{
+    CMappedFile file;
+    const bool isThere = file.Open(path) == EFailure::None;
+    return Decode(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, true, take);
+}
+
+bool DecodeJPEG(std::span<const uint8_t> file, CPixelBuffer& pixels)
+{
+    return DecodeOne(std::as_bytes(file), "JPEG", pixels);
+}
+
+bool EncodePicture(const CPixelBuffer& pixels, std::string_view extension, int32_t quality,
+                   std::vector<uint8_t>& file)
+{
+    const char* format = FormatOfExtension(extension);
+    const CPixelView view(pixels);
+    if (!format || !view || pixels.GetBytesPerPixel() < 3)
+        return false;
+    CPictureCodec* codec = LoadPictureCodec();
+    const CPixelLayout& layout = pixels.Layout();
+    const CPictureHead head{.width = layout.m_iWidth,
+                            .height = layout.m_iHeight,
+                            .horizontalResolution = layout.m_iHorizontalResolution,
+                            .verticalResolution = layout.m_iVerticalResolution};
+    return codec && codec->Encode(head, PackRows(pixels, view).data(), pixels.GetBytesPerPixel(), format,
+                                  quality, file);
+}
+
+bool WritePicture(const std::string& path, const CPixelBuffer& pixels, int32_t quality)
+{
+    std::vector<uint8_t> bytes;
+    CSafeFile file;
+    return EncodePicture(pixels, ExtensionOf(SplitPath(path)), quality, bytes) && file.Open(path) &&
+           file.Write(std::as_bytes(std::span(bytes))) && file.Commit();
+}
+
+} // namespace gw

@@ -1,0 +1,163 @@
+#include "CPictureCodec.h"
+
+#include <algorithm>
+#include <cmath>
+#include <cstring>
+#include <exception>
+#include <string>
+#include <vector>
+
+#include <Magick++.h>
+
+namespace gw {
+
+namespace {
+
+// Pixels take 8 bytes each while they are decoded. Beyond the memory they stand in a file: a picture of 64
+// megapixels is read, one that claims more is refused before anything is taken.
+constexpr MagickCore::MagickSizeType kMemoryBytes = MagickCore::MagickSizeType{32} << 20;
+constexpr MagickCore::MagickSizeType kDiskBytes = MagickCore::MagickSizeType{512} << 20;
+constexpr MagickCore::MagickSizeType kFrameLimit = 4096; // each costs 13 KB, whatever its size
+
+constexpr double kCentimetresPerInch = 2.54;
+
+void Initialize()
+{
+    Magick::InitializeMagick(nullptr);
+    Magick::ResourceLimits::memory(kMemoryBytes);
+    Magick::ResourceLimits::map(0); // a mapped file on a full disk is a signal, not an answer
+    Magick::ResourceLimits::disk(kDiskBytes);
+    Magick::ResourceLimits::listLength(kFrameLimit);
+    Magick::ResourceLimits::thread(1);
+}
+
+int32_t DotsPerInch(double density, Magick::ResolutionType units)
+{
+    if (units == Magick::PixelsPerCentimeterResolution)
+        density *= kCentimetresPerInch;
+    return units == Magick::UndefinedResolution || !(density >= 1.0 && density < 1e6)
+               ? 0
+               : static_cast<int32_t>(std::lround(density));
+}
+
+CPictureHead HeadOf(const Magick::Image& image)
+{
+    const Magick::Geometry page = image.page();
+    return {.width = static_cast<int32_t>(image.columns()),
+            .height = static_cast<int32_t>(image.rows()),
+            .left = static_cast<int32_t>(page.xOff()),
+            .top = static_cast<int32_t>(page.yOff()),
+            .delay = static_cast<uint32_t>(image.animationDelay()),
+            .horizontalResolution = DotsPerInch(image.xResolution(), image.resolutionUnits()),
+            .verticalResolution = DotsPerInch(image.yResolution(), image.resolutionUnits())};
+}
+
+// A cut picture is a warning, and what there is of it comes all the same.
+template <class F>
+void Attempt(F step)
+{
+    try
+    {
+        step();
+    } catch (const Magick::Warning&)
+    {
+    }
+}
+
+std::vector<Magick::Image> ReadFrames(const Magick::Blob& blob, const char* format, bool everyFrame)
+{
+    std::vector<Magick::Image> frames;
+    if (everyFrame)
+    {
+        Magick::ReadOptions options;
+        std::strncpy(options.imageInfo()->magick, format, MaxTextExtent - 1);
+        Attempt([&] { Magick::readImages(&frames, blob, options); });
+        return frames;
+    }
+    Magick::Image& image = frames.emplace_back();
+    image.magick(format);
+    image.subRange(1);
+    Attempt([&] { image.read(blob); });
+    return frames;
+}
+
+bool HandOver(Magick::Image& image, const CPictureSink& sink)
+{
+    const CPictureHead head = HeadOf(image);
+    uint8_t* const pixels = head.width > 0 && head.height > 0 ? sink(head) : nullptr;
+    if (pixels)
+        image.write(0, 0, image.columns(), image.rows(), "BGRA", Magick::CharPixel, pixels);
+    return pixels != nullptr;
+}
+
+bool DecodeFrames(std::span<const std::byte> file, const char* format, bool everyFrame,
+                  const CPictureSink& sink)
+{
+    std::vector<Magick::Image> frames =
+        ReadFrames(Magick::Blob(file.data(), file.size()), format, everyFrame);
+    return !frames.empty() && std::ranges::all_of(frames, [&](auto& frame) { return HandOver(frame, sink); });
+}
+
+// Of a picture with few colours the file keeps exactly these; of others the nearest, without a pattern.
+void PrepareGif(Magick::Image& image)
+{
+    constexpr size_t kColors = 256;
+    image.quantizeColors(kColors);
+    image.quantizeDither(false);
+    image.quantize();
+}
+
+void EncodeFrame(const CPictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
+                 int32_t quality, std::vector<uint8_t>& file)
+{
+    Magick::Image image(static_cast<size_t>(head.width), static_cast<size_t>(head.height),
+                        bytesPerPixel == 4 ? "BGRA" : "BGR", Magick::CharPixel, pixels);
+    image.magick(format);
+    image.resolutionUnits(Magick::PixelsPerInchResolution);
+    image.density(Magick::Geometry(static_cast<size_t>(std::max(head.horizontalResolution, 1)),
+                                   static_cast<size_t>(std::max(head.verticalResolution, 1))));
+    if (std::strcmp(format, "GIF") == 0)
+        PrepareGif(image);
+    else
+        image.quality(static_cast<size_t>(std::clamp(quality, 1, 100)));
+    Magick::Blob blob;
+    Attempt([&] { image.write(&blob); });
+    const auto* bytes = static_cast<const uint8_t*>(blob.data());
+    file.assign(bytes, bytes + blob.length());
+}
+
+class CMagickCodec : public CPictureCodec
+{
+public:
+    bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame,
+                const CPictureSink& sink) override
+    try
+    {
+        return DecodeFrames(file, format, everyFrame, sink);
+    } catch (const std::exception&)
+    {
+        return false;
+    }
+
+    bool Encode(const CPictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
+                int32_t quality, std::vector<uint8_t>& file) override
+    try
+    {
+        EncodeFrame(head, pixels, bytesPerPixel, format, quality, file);
+        return !file.empty();
+    } catch (const std::exception&)
+    {
+        return false;
+    }
+};
+
+} // namespace
+
+} // namespace gw
+
+extern "C" gw::CPictureCodec* gw_picture_codec()
+{
+    static gw::CMagickCodec codec;
+    static const bool ready = (gw::Initialize(), true);
+    return ready ? &codec : nullptr;
+}
