@@ -117,7 +117,8 @@ public:
 
     explicit operator bool() const { return m_pbyPixels != nullptr; }
     TByte* Row(int32_t y) const { return m_pbyPixels + static_cast<size_t>(y) * m_uiStride; }
-    std::span<TByte> Bytes() const
+    std::span<TByte> Bytes() const&& = delete; // such a lock is gone before a loop over them begins
+    std::span<TByte> Bytes() const&
     {
         return {m_pbyPixels, m_pbyPixels ? m_uiStride * static_cast<size_t>(m_kBuffer.GetHeight()) : 0};
     }

@@ -1,0 +1,287 @@
+#include "CAnmImage.h"
+#include "CBlendMaterial.h"
+#include "CImage.h"
+#include "CMultiMaterial.h"
+#include "CNormalBumpTex.h"
+#include "CSprite.h"
+#include "CStandardMaterial.h"
+#include "CTextureMap.h"
+#include "MaterialSamples.h"
+#include "SceneBytes.h"
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+
+#include <filesystem>
+
+namespace gw {
+
+namespace {
+
+CSceneBytes& AddStandardMaterial(CSceneBytes& bytes, uint32_t id, std::initializer_list<uint32_t> textures,
+                                 std::initializer_list<uint32_t> heads = {0, 0, 0})
+{
+    bytes.Object("CStandardMaterial", id, "", heads).Byte(0);
+    for (const float value : {0.2f, 0.2f, 0.2f, 0.8f, 0.0f, 0.0f, 0.5f, 0.5f, 0.5f, 0.0f, 0.0f, 0.0f})
+        bytes.Float(value);
+    for (const float value : {0.5f, 1.0f, 0.0f, 1.0f, 0.0f, 0.0f, 0.0f, 0.0f, 0.0f, 0.0f})
+        bytes.Float(value);
+    return bytes.Word(static_cast<uint32_t>(textures.size())).Words(textures);
+}
+
+std::vector<std::byte> BytesOfRoot(CObject* root)
+{
+    COrrinStream stream;
+    stream.AddRoot(root);
+    return SaveBytes(stream);
+}
+
+} // namespace
+
+TEST(MaterialFile, EveryClassIsWrittenAsTheFormatSays)
+{
+    CSceneBytes standard = Scene().Root();
+    AddStandardMaterial(standard, 1, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0});
+    const Ref<CNormalBumpTex> bump = new CNormalBumpTex;
+    bump->m_bTwoSided = true;
+    bump->m_bUseSecondMap = false;
+    bump->m_fFirstAmount = 0.25f;
+    bump->m_spkSecondMap = new CNormalBumpTex;
+    const Ref<CBlendMaterial> blend = new CBlendMaterial;
+    blend->m_fBlend = 0.75f;
+    blend->m_aspkMtl[1] = new CMultiMaterial;
+    blend->m_spkMask = new CMultiMaterial;
+    const Ref<CTextureMap> map = new CTextureMap;
+    map->m_iUVWChannel = -3;
+    map->m_spkImage = new CImage;
+    const Ref<CSprite> sprite = new CSprite;
+    const Ref<CAnmImage> film = new CAnmImage;
+    film->AddFrame({
+        .m_uiTiming = 1,
+        .m_uiDelay = 2,
+        .m_iLeft = -3,
+        .m_iTop = 4,
+        .m_abyFlags = {5, 6, 7},
+        .m_spkImage = nullptr
+    });
+
+    const struct
+    {
+        Ref<CObject> root;
+        CSceneBytes bytes;
+    } rows[] = {
+        {new CStandardMaterial,                             standard                                        },
+        {                                       bump.Get(), Scene()
+                         .Root()
+                         .Object("CNormalBumpTex", 1)
+                         .Byte(1)
+                         .Byte(1)
+                         .Byte(0)
+                         .Float(0.25f)
+                         .Float(1)
+                         .Words({0, 2})
+                         .Object("CNormalBumpTex", 2)
+                         .Byte(0)
+                         .Byte(1)
+                         .Byte(1)
+                         .Float(1)
+                         .Float(1)
+                         .Words({0, 0})},
+        { blend.Get(),                                       Scene()
+                          .Root()
+                          .Object("CBlendMaterial",                                      1)
+                          .Byte(0)
+                          .Float(0.75f)
+                          .Words({2, 0, 3})
+                          .Object("CMultiMaterial", 2)
+                          .Byte(0)
+                          .Word(0)
+                          .Object("CMultiMaterial", 3)
+                          .Byte(0)
+                          .Word(0)},
+        {                          map.Get(),                Scene()
+                        .Root()
+                        .Object("CTextureMap",                                                                1)
+                        .Byte(0)
+                        .Words({uint32_t(-3), 2})
+                        .Object("CImage", 2)
+                        .Text("")
+                        .Add<uint16_t>(0)
+                        .Byte(1)
+                        .Word(0)},
+        {                                                                    sprite.Get(),          Scene().Root().Object("CSprite",                           1).Words({0, 1, 0}).Byte(0).Word(0)},
+        {                                                                 film.Get(),
+         Scene().Root().Object("CAnmImage",1).Text("").Words({1, 1, 2, uint32_t(-3), 4, 0x070605, 0})},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.root->GetRTTI()->m_pcName);
+        EXPECT_EQ(BytesOfRoot(row.root.Get()), row.bytes.Bytes());
+        COrrinStream again;
+        ASSERT_TRUE(LoadBytes(again, row.bytes.Bytes()));
+        EXPECT_EQ(SaveBytes(again), row.bytes.Bytes());
+    }
+}
+
+TEST(MaterialFile, EveryValueComesBackInEveryVersion)
+{
+    const Ref<CObject> root = SampleMaterial();
+    const std::string told = DescribeRoot(root.Get());
+    COrrinStream stream;
+    stream.AddRoot(root.Get());
+    const std::vector<std::byte> bytes = SaveBytes(stream);
+    uint64_t size = 58 + 14;
+    for (const CObject* object : stream.ObjectsInSaveOrder())
+        size += object->GetDiskUsed();
+    EXPECT_EQ(bytes.size(), size);
+    const CTempFolder folder;
+    for (const char* version : {"1.20", "1.10", "1.01"})
+    {
+        const std::string_view text(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+        WriteBytes(folder.Path("a.orn"), CSceneBytes().Header(version).Raw(text).View());
+        COrrinStream again;
+        ASSERT_TRUE(again.LoadFile(folder.Path("a.orn"), false));
+        EXPECT_EQ(Describe(again), told) << version;
+        EXPECT_EQ(SaveBytes(again), bytes) << version;
+    }
+    CSceneBytes old;
+    old.Header("1.00").EmptyThumbnail().Root();
+    AddStandardMaterial(old, 1, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 2}, {0});
+    old.Object("CTextureMap", 2, "", {0}).Byte(7).Words({3, 0});
+    WriteBytes(folder.Path("old.orn"), old.View());
+    COrrinStream again;
+    ASSERT_TRUE(again.LoadFile(folder.Path("old.orn"), false));
+    EXPECT_FALSE(again.Record().Failure());
+    const auto& material = static_cast<CStandardMaterial&>(*again.GetRoot(0));
+    const auto* texture = RecordCast<CTextureMap>(material.m_aspkTexture[TT_Displacement].Get());
+    ASSERT_NE(texture, nullptr);
+    EXPECT_EQ(texture->m_iUVWChannel, 3);
+    EXPECT_TRUE(texture->m_bTwoSided) << "any byte but 0 is true";
+}
+
+TEST(MaterialFile, AsManyTexturesAreReadAsAreStoredAndTwelveAreKept)
+{
+    const struct
+    {
+        const char* what;
+        std::initializer_list<uint32_t> stored;
+        std::initializer_list<uint32_t> kept;
+    } rows[] = {
+        {"none",     {},                                      {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"one",      {7},                                     {2, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"thirteen", {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 7, 0, 7}, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 2, 0}},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CSceneBytes bytes = Scene().Root();
+        AddStandardMaterial(bytes, 1, row.stored).Root().Object("CTextureMap", 7).Byte(0).Words({0, 0});
+        CSceneBytes written = Scene().Root();
+        AddStandardMaterial(written, 1, row.kept).Root().Object("CTextureMap", 2).Byte(0).Words({0, 0});
+        COrrinStream stream;
+        ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
+        EXPECT_EQ(SaveBytes(stream), written.Bytes());
+    }
+    CSceneBytes damaged = Scene().Root();
+    AddStandardMaterial(damaged, 1, {});
+    std::vector<std::byte> bytes = damaged.Bytes();
+    std::fill(bytes.end() - 4, bytes.end(), std::byte{0xff});
+    COrrinStream stream;
+    EXPECT_FALSE(LoadBytes(stream, bytes));
+}
+
+TEST(MaterialFile, DamageStaysInside)
+{
+    const std::vector<std::byte> whole = BytesOfRoot(SampleMaterial(EPixelStorage::Heap).Get());
+    const uint32_t before = g_uiObjectCount;
+    for (size_t size = 0; size < whole.size(); ++size)
+    {
+        COrrinStream stream;
+        const bool loaded = LoadBytes(stream, std::span(whole).first(size));
+        ASSERT_EQ(loaded, !stream.Record().Failure()) << size;
+    }
+    for (const uint32_t word : {0xffffffffu, 0x80000000u, 0x15555556u, 1u})
+    {
+        for (size_t at = 0; at + 4 <= whole.size(); ++at)
+        {
+            std::vector<std::byte> bytes = whole;
+            std::memcpy(bytes.data() + at, &word, 4);
+            COrrinStream stream;
+            stream.LoadBuffer(bytes, 0);
+            ASSERT_TRUE(SurvivesRewriting(stream)) << word << " at " << at;
+        }
+    }
+    EXPECT_EQ(g_uiObjectCount, before);
+}
+
+TEST(MaterialFile, LinksOfAnotherClassAreNullAndAbstractClassesEndTheReading)
+{
+    CSceneBytes bytes = Scene().Root();
+    AddStandardMaterial(bytes, 1, {1, 2, 3, 9, 0, 0, 0, 0, 0, 0, 0, 0}); // a material is no texture
+    bytes.Object("CTextureMap", 2).Byte(0).Words({0, 2});                // a texture is no image
+    bytes.Object("CBlendMaterial", 3).Byte(0).Float(0).Words({2, 2, 1}); // a texture may be a material
+    bytes.Root().Object("CBlendMaterial", 4).Byte(0).Float(0).Words({2, 9, 1});
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
+    const auto& material = static_cast<CStandardMaterial&>(*stream.GetRoot(0));
+    EXPECT_EQ(material.m_aspkTexture[0].Get(), nullptr);
+    ASSERT_NE(material.m_aspkTexture[1].Get(), nullptr);
+    EXPECT_EQ(static_cast<CTextureMap&>(*material.m_aspkTexture[1]).m_spkImage.Get(), nullptr);
+    EXPECT_EQ(material.m_aspkTexture[2].Get(), nullptr);
+    const auto& blend = static_cast<CBlendMaterial&>(*stream.GetRoot(1));
+    EXPECT_EQ(blend.m_spkMask.Get(), material.m_aspkTexture[1].Get());
+    EXPECT_EQ(blend.m_aspkMtl[0].Get(), nullptr);
+    EXPECT_EQ(blend.m_aspkMtl[1].Get(), &material);
+
+    for (const char* name : {"CMultiTex", "CBlendTex", "CTexture", "CMaterial", "CMaterialBase"})
+    {
+        COrrinStream other;
+        EXPECT_FALSE(LoadBytes(other, Scene().Root().Object(name, 1).Byte(0).Bytes())) << name;
+        EXPECT_EQ(other.Record().Failure().reason, EFailure::UnknownClass);
+    }
+}
+
+TEST(Clone, MaterialsShareTheCopyOfWhatTheyShare)
+{
+    const Ref<CObject> root = SampleMaterial();
+    CCloneMap map;
+    const Ref<CObject> copy = root->Clone(map);
+    EXPECT_EQ(DescribeRoot(copy.Get()), DescribeRoot(root.Get()));
+    const auto& blend = static_cast<CBlendMaterial&>(*static_cast<CMultiMaterial&>(*copy).m_kSubMaterials[1]);
+    EXPECT_EQ(blend.m_aspkMtl[0], blend.m_aspkMtl[1]) << "one material stays one";
+    EXPECT_NE(
+        blend.m_aspkMtl[0],
+        static_cast<CBlendMaterial&>(*static_cast<CMultiMaterial&>(*root).m_kSubMaterials[1]).m_aspkMtl[0]);
+    const Ref<CObject> bare = root->CreateClone();
+    EXPECT_TRUE(bare->HeldObjects().empty()) << "a copy starts without what is attached";
+}
+
+TEST(Find, MaterialsAreSearchedInStoredOrderThemselvesFirst)
+{
+    const Ref<CObject> root = SampleMaterial();
+    EXPECT_EQ(root->FindObject(nullptr, &CMaterialBase::ms_kRTTI, true), root.Get());
+    std::vector<CObject*> found;
+    root->FindObjects(found, nullptr, &CImage::ms_kRTTI, false);
+    ASSERT_EQ(found.size(), 3u) << "a shared image is met at each of its places";
+    EXPECT_EQ(found[0]->NameView(), "wood");
+    EXPECT_EQ(found[1], found[0]);
+    EXPECT_EQ(found[2]->NameView(), "bricks");
+    EXPECT_EQ(root->FindObject("wood", &CTexture::ms_kRTTI, true)->GetRTTI(), &CTextureMap::ms_kRTTI)
+        << "the texture before its image of the same name";
+}
+
+TEST(CMultiMaterial, ANewCountDropsEveryEntry)
+{
+    const Ref<CMultiMaterial> multi = new CMultiMaterial;
+    const Ref<CStandardMaterial> material = new CStandardMaterial;
+    multi->SetSubMaterialCount(2);
+    multi->m_kSubMaterials[0] = material.Get();
+    multi->SetSubMaterialCount(3);
+    EXPECT_EQ(multi->m_kSubMaterials.size(), 3u);
+    EXPECT_EQ(multi->m_kSubMaterials[0].Get(), nullptr);
+    EXPECT_EQ(material->GetRefCount(), 1u);
+    EXPECT_EQ(BytesOfRoot(new CMultiMaterial).size(), 58 + 14 + multi->GetDiskUsed() - 12)
+        << "0 entries are a count";
+}
+
+} // namespace gw

@@ -1,0 +1,86 @@
+#pragma once
+
+#include "CAnmImage.h"
+#include "CBlendMaterial.h"
+#include "CImage.h"
+#include "CMultiMaterial.h"
+#include "CNormalBumpTex.h"
+#include "CStandardMaterial.h"
+#include "CTextureMap.h"
+
+namespace gw {
+
+/// An image that is stored plainly, with every pixel of its own.
+inline Ref<CImage> PlainImage(const char* name, int32_t format = 0,
+                              EPixelStorage storage = EPixelStorage::Heap)
+{
+    Ref<CImage> image = new CImage;
+    image->SetName(name);
+    image->m_bJPEG = false;
+    CPixelBuffer& pixels = image->Pixels();
+    pixels.SetStorage(storage);
+    pixels.SetRowAlignment(true);
+    pixels.SetResolution(72, 300);
+    pixels.Create(3, 2, format);
+    uint8_t value = 0;
+    const CPixelLock lock(pixels);
+    for (uint8_t& byte : lock.Bytes())
+        byte = ++value;
+    return image;
+}
+
+/// A texture with an image of the same name.
+inline Ref<CTextureMap> MapOf(CImage* image)
+{
+    Ref<CTextureMap> map = new CTextureMap;
+    map->SetName(image->GetName());
+    map->m_iUVWChannel = 3;
+    map->m_spkImage = image;
+    return map;
+}
+
+inline Ref<CStandardMaterial> FullMaterial()
+{
+    Ref<CStandardMaterial> material = new CStandardMaterial;
+    material->m_bTwoSided = true;
+    float value = 0.0f;
+    for (Vec3* color :
+         {&material->m_kAmbient, &material->m_kDiffuse, &material->m_kSpecular, &material->m_kFilter})
+    {
+        *color = {value + 1, value + 2, value + 3};
+        value += 3;
+    }
+    for (float* number :
+         {&material->m_fShininess, &material->m_fShineStrength, &material->m_fSelfIllum,
+          &material->m_fOpacity, &material->m_fOpfall, &material->m_fWireSize, &material->m_fIORefract,
+          &material->m_fDimIntens, &material->m_fDimMult, &material->m_fSoftThresh})
+        *number = ++value;
+    return material;
+}
+
+/// A graph with each kind of material and texture, no value at its default, images that are shared and in
+/// both kinds of storage, and a material that is blended with itself.
+inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::TempStore)
+{
+    const Ref<CImage> wood = PlainImage("wood");
+    const Ref<CStandardMaterial> material = FullMaterial();
+    const Ref<CNormalBumpTex> bump = new CNormalBumpTex;
+    bump->m_bUseFirstMap = false;
+    bump->m_fSecondAmount = 2.0f;
+    bump->m_spkFirstMap = MapOf(wood.Get()).Get();
+    bump->m_spkSecondMap = MapOf(PlainImage("bricks", 1, bricksStorage).Get()).Get();
+    material->m_aspkTexture[TT_Diffuse] = MapOf(wood.Get()).Get();
+    material->m_aspkTexture[TT_Bump] = bump.Get();
+
+    const Ref<CBlendMaterial> blend = new CBlendMaterial;
+    blend->m_fBlend = 0.5f;
+    blend->m_aspkMtl[0] = FullMaterial().Get();
+    blend->m_aspkMtl[1] = blend->m_aspkMtl[0].Get();
+    Ref<CMultiMaterial> multi = new CMultiMaterial;
+    multi->SetSubMaterialCount(3);
+    multi->m_kSubMaterials[0] = material.Get();
+    multi->m_kSubMaterials[1] = blend.Get();
+    return multi.Get();
+}
+
+} // namespace gw

@@ -1,0 +1,252 @@
+#include "Blit.h"
+#include "CPixelBuffer.h"
+#include "CTempStore.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <array>
+#include <climits>
+#include <vector>
+
+namespace gw {
+
+namespace {
+
+constexpr uint8_t kPixel[4] = {1, 2, 3, 4};
+
+std::vector<int> BytesOf(const CPixelBuffer& buffer)
+{
+    const CPixelView view(buffer);
+    return {view.Bytes().begin(), view.Bytes().end()};
+}
+
+using testing::ElementsAre;
+
+class EveryStorage : public testing::TestWithParam<EPixelStorage>
+{
+};
+
+} // namespace
+
+TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
+{
+    const struct
+    {
+        int32_t width, height, format;
+        bool aligned;
+        size_t stride, block; // 0 for refused
+    } rows[] = {
+        {5,       1,     0,  false, 20, 20},
+        {5,       1,     1,  false, 15, 16},
+        {5,       1,     1,  true,  16, 17},
+        {5,       3,     2,  false, 10, 32},
+        {5,       3,     3,  true,  12, 38},
+        {5,       3,     4,  false, 10, 32},
+        {5,       3,     5,  true,  8,  27},
+        {1,       1,     5,  false, 1,  4 },
+        {5,       3,     6,  false, 0,  0 },
+        {5,       3,     -1, false, 0,  0 },
+        {0,       3,     0,  false, 0,  0 },
+        {5,       0,     1,  false, 0,  0 },
+        {-5,      3,     0,  false, 0,  0 },
+        {5,       -3,    0,  false, 0,  0 },
+        {INT_MAX, 2,     0,  true,  0,  0 },
+        {65536,   65536, 5,  false, 0,  0 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(testing::Message() << row.width << " x " << row.height << " in " << row.format);
+        CPixelBuffer buffer;
+        EXPECT_TRUE(buffer.SetRowAlignment(row.aligned));
+        EXPECT_EQ(buffer.Create(row.width, row.height, row.format), row.block != 0);
+        EXPECT_EQ(buffer.GetStride(), row.stride);
+        EXPECT_EQ(buffer.GetBlockBytes(), row.block);
+        EXPECT_EQ(buffer.SetRowAlignment(!row.aligned), row.block == 0);
+    }
+}
+
+TEST_P(EveryStorage, CreateFillsClearsAndRefusesAsStated)
+{
+    std::array<uint8_t, 64> block;
+    block.fill(9);
+    CPixelBuffer buffer;
+    buffer.SetRowAlignment(true);
+    if (GetParam() == EPixelStorage::Foreign)
+        EXPECT_TRUE(buffer.Attach(block.data(), 3, 2, 1));
+    else
+        EXPECT_TRUE(buffer.SetStorage(GetParam()));
+    ASSERT_TRUE(buffer.Create(3, 2, 1, kPixel));
+    EXPECT_THAT(BytesOf(buffer),
+                ElementsAre(1, 2, 3, 1, 2, 3, 1, 2, 3, 0, 0, 0, 1, 2, 3, 1, 2, 3, 1, 2, 3, 0, 0, 0));
+    EXPECT_EQ(buffer.GetHandle() >= kLeastTempHandle, GetParam() == EPixelStorage::TempStore);
+    EXPECT_FALSE(buffer.Create(3, 2, 6)) << "leaves everything as it was";
+    EXPECT_EQ(BytesOf(buffer)[4], 2);
+    ASSERT_TRUE(buffer.Create(3, 2, 1));
+    EXPECT_EQ(BytesOf(buffer), std::vector<int>(24));
+    EXPECT_EQ(buffer.Create(2, 2, 0, kPixel), GetParam() != EPixelStorage::Foreign);
+    if (GetParam() != EPixelStorage::Foreign)
+    {
+        EXPECT_THAT(BytesOf(buffer), ElementsAre(1, 2, 3, 4, 1, 2, 3, 4, 1, 2, 3, 4, 1, 2, 3, 4));
+    }
+    EXPECT_TRUE(buffer.Free());
+    EXPECT_TRUE(buffer.IsEmpty());
+    EXPECT_EQ(buffer.GetHandle(), 0u);
+    EXPECT_EQ(block[24], 9) << "what belongs to others stays whole";
+}
+
+TEST_P(EveryStorage, CopiesTakeEverythingButWhereItIsKept)
+{
+    CPixelBuffer source;
+    source.SetStorage(EPixelStorage::TempStore);
+    source.SetRowAlignment(true);
+    source.SetResolution(72, 300);
+    source.Create(3, 2, 1, kPixel);
+    CPixelLock(source).Row(1)[4] = 99;
+    std::array<uint8_t, 24> block{};
+    CPixelBuffer copy;
+    copy.SetRowAlignment(true);
+    if (GetParam() == EPixelStorage::Foreign)
+        copy.Attach(block.data(), 3, 2, 1);
+    else
+        copy.SetStorage(GetParam());
+    ASSERT_TRUE(copy.Copy(source));
+    EXPECT_EQ(BytesOf(copy), BytesOf(source));
+    EXPECT_EQ(BytesOf(copy)[16], 99);
+    EXPECT_EQ(copy.GetStorage(), GetParam());
+    EXPECT_EQ(copy.Layout().m_iVerticalResolution, 300);
+    EXPECT_FALSE(copy.Copy(CPixelBuffer())) << "of nothing there is no copy";
+    source.Create(4, 2, 1);
+    EXPECT_EQ(copy.Copy(source), GetParam() != EPixelStorage::Foreign);
+    const CPixelBuffer made(copy);
+    EXPECT_EQ(BytesOf(made), BytesOf(copy));
+    EXPECT_NE(made.GetStorage(), EPixelStorage::Foreign) << "a copy owns its pixels";
+}
+
+TEST_P(EveryStorage, WhatIsLockedStaysWhereItIs)
+{
+    std::array<uint8_t, 24> block{};
+    CPixelBuffer buffer;
+    EXPECT_FALSE(CPixelLock(buffer));
+    if (GetParam() == EPixelStorage::Foreign)
+        buffer.Attach(block.data(), 3, 2, 1);
+    else
+        buffer.SetStorage(GetParam());
+    buffer.Create(3, 2, 1);
+    const uint32_t revision = buffer.GetRevision();
+    {
+        const CPixelView view(buffer);
+        const CPixelView second(buffer);
+        EXPECT_EQ(view.Row(1), second.Row(0) + buffer.GetStride());
+        EXPECT_EQ(buffer.GetLockCount(), 2);
+        EXPECT_EQ(buffer.GetRevision(), revision) << "looking changes nothing";
+        EXPECT_FALSE(buffer.Free());
+        EXPECT_FALSE(buffer.Create(4, 4, 0));
+        EXPECT_FALSE(buffer.Attach(block.data(), 1, 1, 5));
+        EXPECT_TRUE(buffer.Create(3, 2, 1, kPixel)) << "the same size keeps its block";
+        EXPECT_EQ(view.Row(1)[3], 1);
+    }
+    EXPECT_EQ(buffer.GetLockCount(), 0);
+    EXPECT_NE(buffer.GetRevision(), revision);
+}
+
+INSTANTIATE_TEST_SUITE_P(CPixelBuffer, EveryStorage,
+                         testing::Values(EPixelStorage::Heap, EPixelStorage::TempStore,
+                                         EPixelStorage::Foreign));
+
+TEST(Blit, MixesByOpacityInAllPairings)
+{
+    const uint8_t to[4] = {100, 100, 100, 100};
+    const uint8_t from[4] = {0, 200, 255, 20};
+    const struct
+    {
+        int32_t to, from;
+        uint8_t opacity;
+        std::vector<int> pixel;
+    } rows[] = {
+        {0, 0, 255, {0, 200, 255, 20}   },
+        {0, 0, 51,  {80, 120, 131, 84}  },
+        {0, 1, 255, {0, 200, 255, 255}  },
+        {0, 1, 51,  {80, 120, 131, 131} },
+        {1, 0, 255, {0, 200, 255}       },
+        {1, 0, 51,  {80, 120, 131}      },
+        {1, 1, 255, {0, 200, 255}       },
+        {1, 1, 128, {50, 150, 178}      },
+        {0, 0, 0,   {100, 100, 100, 100}},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(testing::Message() << row.from << " on " << row.to << " by " << int(row.opacity));
+        CPixelBuffer destination;
+        CPixelBuffer source;
+        destination.SetStorage(EPixelStorage::TempStore);
+        destination.Create(1, 1, row.to, to);
+        source.Create(1, 1, row.from, from);
+        EXPECT_TRUE(Blit(destination, 0, 0, source, 0, 0, 1, 1, row.opacity));
+        EXPECT_EQ(BytesOf(destination), row.pixel);
+    }
+}
+
+TEST(Blit, IsCutToBothPictures)
+{
+    // A source of 3 x 3 pixels numbered from 1 on, on a destination of 4 x 3 zeros.
+    const struct
+    {
+        const char* what;
+        int32_t x, y, sourceX, sourceY, width, height;
+        std::vector<int> blues;
+    } rows[] = {
+        {"inside",            1,       1,       0,  0,       2,       2,       {0, 0, 0, 0, 0, 1, 2, 0, 0, 4, 5, 0}},
+        {"left and above",    -1,      -2,      0,  0,       3,       3,       {8, 9, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"right and below",   3,       2,       0,  0,       3,       3,       {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 1}},
+        {"source begins out", 0,       0,       -1, -1,      3,       3,       {0, 0, 0, 0, 0, 1, 2, 0, 0, 4, 5, 0}},
+        {"source ends",       0,       0,       2,  2,       9,       9,       {9, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"all beside",        4,       0,       0,  0,       3,       3,       {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"nothing",           0,       0,       0,  0,       -3,      3,       {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"far away",          INT_MIN, INT_MIN, 0,  0,       INT_MAX, INT_MAX, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"far in the source", 0,       0,       0,  INT_MIN, INT_MAX, INT_MAX, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+    };
+    CPixelBuffer source;
+    source.Create(3, 3, 1);
+    for (int32_t i = 0; i < 9; ++i)
+        CPixelLock(source).Row(i / 3)[i % 3 * 3] = static_cast<uint8_t>(i + 1);
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CPixelBuffer destination;
+        destination.Create(4, 3, 0);
+        EXPECT_TRUE(
+            Blit(destination, row.x, row.y, source, row.sourceX, row.sourceY, row.width, row.height, 255));
+        std::vector<int> blues;
+        for (int32_t i = 0; i < 12; ++i)
+            blues.push_back(CPixelView(destination).Row(i / 4)[i % 4 * 4]);
+        EXPECT_EQ(blues, row.blues);
+    }
+}
+
+TEST(Blit, OverlappingPartsOfOnePictureAreTakenAsTheyWere)
+{
+    CPixelBuffer buffer;
+    buffer.Create(4, 1, 1);
+    for (int32_t x = 0; x < 4; ++x)
+        CPixelLock(buffer).Row(0)[x * 3] = static_cast<uint8_t>(x + 1);
+    EXPECT_TRUE(Blit(buffer, 1, 0, buffer, 0, 0, 3, 1, 255));
+    EXPECT_THAT(BytesOf(buffer), ElementsAre(1, 0, 0, 1, 0, 0, 2, 0, 0, 3, 0, 0));
+}
+
+TEST(Blit, RefusesOtherFormatsAndEmptyPictures)
+{
+    for (int32_t format = 2; format < 6; ++format)
+    {
+        CPixelBuffer known;
+        CPixelBuffer other;
+        known.Create(2, 2, 0);
+        other.Create(2, 2, format, kPixel);
+        EXPECT_FALSE(Blit(known, 0, 0, other, 0, 0, 2, 2, 255)) << format;
+        EXPECT_FALSE(Blit(other, 0, 0, known, 0, 0, 2, 2, 255)) << format;
+        EXPECT_EQ(BytesOf(known), std::vector<int>(16));
+        EXPECT_FALSE(Blit(known, 0, 0, CPixelBuffer(), 0, 0, 2, 2, 255));
+    }
+}
+
+} // namespace gw

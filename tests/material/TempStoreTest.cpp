@@ -1,0 +1,218 @@
+#include "CTempPagedFile.h"
+#include "CTempStore.h"
+#include "Paths.h"
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+
+#include <csignal>
+#include <cstring>
+#include <thread>
+
+#include <sys/resource.h>
+#include <sys/stat.h>
+
+namespace gw {
+
+namespace {
+
+constexpr uint64_t kFile = CTempPagedFile::kFileBytes;
+constexpr uint64_t kPage = CTempPagedFile::kPageBytes;
+
+class TempStore : public testing::Test
+{
+protected:
+    size_t FileCount() const { return FilesInFolder(m_kStore.GetFolder(), ".tmp").size(); }
+
+    CTempFolder m_kFolder;
+    CTempStore m_kStore{m_kFolder.Path("TKTmp/")};
+};
+
+// Files of this process cannot grow beyond a size while this lives, as on a full disk.
+class CFullDisk
+{
+public:
+    explicit CFullDisk(rlim_t byteCount) : m_pkHandler(std::signal(SIGXFSZ, SIG_IGN))
+    {
+        getrlimit(RLIMIT_FSIZE, &m_kLimit);
+        const rlimit full{byteCount, m_kLimit.rlim_max};
+        setrlimit(RLIMIT_FSIZE, &full);
+    }
+    ~CFullDisk()
+    {
+        setrlimit(RLIMIT_FSIZE, &m_kLimit);
+        std::signal(SIGXFSZ, m_pkHandler);
+    }
+
+private:
+    rlimit m_kLimit{};
+    void (*m_pkHandler)(int);
+};
+
+} // namespace
+
+TEST_F(TempStore, SizesDecideBetweenPagesAndAFileOfTheirOwn)
+{
+    EXPECT_FALSE(FolderExists(m_kStore.GetFolder()));
+    EXPECT_EQ(m_kStore.Allocate(1), 0x00010001u);
+    EXPECT_EQ(m_kStore.Allocate(kFile), 0x00020001u) << "takes all pages of a fresh file";
+    EXPECT_EQ(m_kStore.Allocate(kFile + 1), 0x00030001u) << "one byte more has its own";
+    EXPECT_EQ(m_kStore.GetTotal(), 3 * kFile + 1);
+    EXPECT_EQ(m_kStore.Allocate(kPage), 0x00010002u) << "the next page of the first file";
+    EXPECT_EQ(m_kStore.Allocate(kPage + 1), 0x00010003u);
+    EXPECT_EQ(m_kStore.Allocate(0), 0x00010005u) << "even nothing takes a page";
+    EXPECT_EQ(FileCount(), 3u);
+    uint64_t size = 0;
+    EXPECT_TRUE(FileSize(m_kStore.GetFolder() + FilesInFolder(m_kStore.GetFolder(), ".tmp")[0], size));
+    EXPECT_GE(size, kFile);
+    EXPECT_TRUE(FilesInFolder(m_kStore.GetFolder(), ".tmp")[0].starts_with("TK_"));
+}
+
+TEST_F(TempStore, TheFirstGapThatFitsIsTaken)
+{
+    uint32_t blocks[5];
+    for (uint32_t& block : blocks)
+        block = m_kStore.Allocate(2 * kPage);
+    m_kStore.Free(blocks[1]);
+    m_kStore.Free(blocks[3]);
+    EXPECT_EQ(m_kStore.Allocate(3 * kPage), 0x0001000bu) << "no gap is large enough";
+    EXPECT_EQ(m_kStore.Allocate(kPage), blocks[1]);
+    EXPECT_EQ(m_kStore.Allocate(2 * kPage), blocks[3]);
+    m_kStore.Free(blocks[2]);
+    EXPECT_EQ(m_kStore.Allocate(3 * kPage), blocks[1] + 1) << "neighbours that are free make one gap";
+}
+
+TEST_F(TempStore, ABlockKeepsItsBytesWhileNobodyLooks)
+{
+    const uint32_t small = m_kStore.Allocate(3 * kPage);
+    const uint32_t other = m_kStore.Allocate(kPage);
+    const uint32_t large = m_kStore.Allocate(kFile + 5);
+    for (const auto& [handle, size] : {
+             std::pair{small, 3 * kPage},
+             {other, kPage    },
+             {large, kFile + 5}
+    })
+    {
+        std::byte* const bytes = m_kStore.Map(handle);
+        ASSERT_NE(bytes, nullptr);
+        EXPECT_EQ(m_kStore.Map(handle), bytes) << "a second use sees the same view";
+        std::memset(bytes, static_cast<int>(handle >> 16 ^ handle), size);
+        m_kStore.Unmap(handle);
+        bytes[size - 1] = std::byte{77}; // the first use still holds
+        m_kStore.Unmap(handle);
+    }
+    for (const auto& [handle, size] : {
+             std::pair{small, 3 * kPage},
+             {other, kPage    },
+             {large, kFile + 5}
+    })
+    {
+        std::byte* const bytes = m_kStore.Map(handle);
+        EXPECT_EQ(bytes[0], static_cast<std::byte>(handle >> 16 ^ handle));
+        EXPECT_EQ(bytes[size - 1], std::byte{77});
+        m_kStore.Unmap(handle);
+    }
+}
+
+TEST_F(TempStore, UnknownHandlesDoNothing)
+{
+    const uint32_t handle = m_kStore.Allocate(2 * kPage);
+    for (const uint32_t unknown : {0u, 1u, 65536u, handle + 1, handle + 0x10000, 0xffffffffu})
+    {
+        EXPECT_EQ(m_kStore.Map(unknown), nullptr) << unknown;
+        m_kStore.Unmap(unknown);
+        m_kStore.Free(unknown);
+    }
+    EXPECT_NE(m_kStore.Map(handle), nullptr);
+}
+
+TEST_F(TempStore, TheLastBlockTakesFileAndFolderAlong)
+{
+    const uint32_t first = m_kStore.Allocate(1);
+    const uint32_t second = m_kStore.Allocate(kFile + 1);
+    const uint32_t third = m_kStore.Allocate(kFile);
+    m_kStore.Free(second);
+    EXPECT_EQ(FileCount(), 2u);
+    EXPECT_EQ(m_kStore.GetTotal(), 2 * kFile);
+    EXPECT_EQ(m_kStore.Allocate(kFile), second) << "a null slot is used first";
+    m_kStore.Free(second);
+    m_kStore.Free(third);
+    EXPECT_TRUE(FolderExists(m_kStore.GetFolder()));
+    m_kStore.Free(first);
+    EXPECT_EQ(m_kStore.GetTotal(), 0u);
+    EXPECT_FALSE(FolderExists(m_kStore.GetFolder()));
+    EXPECT_EQ(m_kStore.Allocate(1), first) << "and the folder comes back";
+}
+
+TEST_F(TempStore, TheLimitCountsWholeFiles)
+{
+    m_kStore.SetLimit(kFile + 100);
+    EXPECT_EQ(m_kStore.Allocate(kFile + 101), 0u);
+    EXPECT_EQ(m_kStore.Allocate(UINT64_MAX), 0u);
+    EXPECT_NE(m_kStore.Allocate(kFile - kPage), 0u);
+    EXPECT_EQ(m_kStore.Allocate(101 + kPage), 0u) << "a new file would be too much";
+    EXPECT_NE(m_kStore.Allocate(kPage), 0u) << "a page of the file that is there is not";
+    m_kStore.SetLimit(0);
+    EXPECT_NE(m_kStore.Allocate(kPage), 0u);
+}
+
+// A touch of what is not there would be a signal.
+TEST_F(TempStore, SpaceIsReservedBeforeItIsTouched)
+{
+    m_kStore.Allocate(10 * kPage);
+    const std::string name = FilesInFolder(m_kStore.GetFolder(), ".tmp").at(0);
+    struct stat status = {};
+    ASSERT_EQ(stat((m_kStore.GetFolder() + name).c_str(), &status), 0);
+    constexpr int64_t kSector = 512;
+    EXPECT_GE(status.st_blocks * kSector, int64_t{10 * kPage});
+    EXPECT_LT(status.st_blocks * kSector, int64_t{kFile / 2}) << "a small block does not cost a whole file";
+}
+
+TEST_F(TempStore, AFullDiskIsAnAnswer)
+{
+    const uint32_t before = m_kStore.Allocate(kPage);
+    {
+        const CFullDisk full(kFile / 2);
+        EXPECT_EQ(m_kStore.Allocate(kFile + 1), 0u);
+        EXPECT_EQ(m_kStore.GetTotal(), kFile);
+        EXPECT_EQ(FileCount(), 1u);
+        EXPECT_NE(m_kStore.Allocate(kPage), 0u) << "what there is room for";
+    }
+    EXPECT_NE(m_kStore.Map(before), nullptr);
+    WriteBytes(m_kFolder.Path("file"), "x");
+    CTempStore nowhere(m_kFolder.Path("file/TKTmp/"));
+    EXPECT_EQ(nowhere.Allocate(1), 0u);
+}
+
+TEST_F(TempStore, ViewsMayBeTakenInSeveralThreads)
+{
+    const uint32_t handle = m_kStore.Allocate(kPage);
+    const auto count = [&] {
+        for (int i = 0; i < 2000; ++i)
+        {
+            ASSERT_NE(m_kStore.Map(handle), nullptr);
+            m_kStore.Unmap(handle);
+        }
+    };
+    std::thread other(count);
+    count();
+    other.join();
+    std::byte* const bytes = m_kStore.Map(handle);
+    bytes[kPage - 1] = std::byte{1};
+    m_kStore.Unmap(handle);
+}
+
+TEST_F(TempStore, APurgeTakesWhatACrashLeft)
+{
+    CreateFolder(m_kFolder.Path("old"));
+    WriteBytes(m_kFolder.Path("old/TK_1.tmp"), "x");
+    WriteBytes(m_kFolder.Path("old/keep.txt"), "x");
+    CTempStore::Purge(m_kFolder.Path("old"));
+    EXPECT_FALSE(FileExists(m_kFolder.Path("old/TK_1.tmp")));
+    EXPECT_TRUE(FileExists(m_kFolder.Path("old/keep.txt")));
+    DeleteFile(m_kFolder.Path("old/keep.txt"));
+    CTempStore::Purge(m_kFolder.Path("old"));
+    EXPECT_FALSE(FolderExists(m_kFolder.Path("old")));
+}
+
+} // namespace gw
