@@ -43,7 +43,7 @@ public:
     Vec3 m_kAmbient{0.2f, 0.2f, 0.2f};
     Vec3 m_kDiffuse{0.8f, 0.0f, 0.0f}; ///< red and not grey, on purpose
     Vec3 m_kSpecular{0.5f, 0.5f, 0.5f};
-    Vec3 m_kFilter;
+    Vec3 m_kFilter{0.0f, 0.0f, 0.0f};
     float m_fShininess = 0.5f;
     float m_fShineStrength = 1.0f;
     float m_fSelfIllum = 0.0f;

@@ -72,6 +72,10 @@ uint32_t CTempStore::AllocateInNewFile(uint64_t byteCount)
     // Compared by subtraction: a size may be anything.
     if (m_uiLimit != 0 && (byteCount > m_uiLimit || m_uiTotal > m_uiLimit - byteCount))
         return 0;
+    // What a run that was killed left goes with the first file. Another program that is alive loses the names
+    // of its files and nothing else.
+    if (m_kFiles.empty())
+        Purge(m_kFolder);
     const bool single = byteCount > CTempPagedFile::kFileBytes;
     const size_t index = single ? AddFile(std::make_unique<CTempSingleFile>(m_kFolder, byteCount))
                                 : AddFile(std::make_unique<CTempPagedFile>(m_kFolder));

@@ -215,4 +215,19 @@ TEST_F(TempStore, APurgeTakesWhatACrashLeft)
     EXPECT_FALSE(FolderExists(m_kFolder.Path("old")));
 }
 
+TEST_F(TempStore, TheFirstFileTakesAwayWhatACrashLeftAndHarmsNobodyAlive)
+{
+    const uint32_t handle = m_kStore.Allocate(1);
+    CreateFolder(m_kStore.GetFolder());
+    WriteBytes(m_kStore.GetFolder() + "TK_old.tmp", "x");
+    CTempStore other(m_kStore.GetFolder());
+    const uint32_t theirs = other.Allocate(1);
+    EXPECT_FALSE(FileExists(m_kStore.GetFolder() + "TK_old.tmp"));
+    EXPECT_EQ(FileCount(), 1u);
+    other.Free(theirs);
+    std::byte* const bytes = m_kStore.Map(handle);
+    ASSERT_NE(bytes, nullptr);
+    bytes[kPage - 1] = std::byte{1};
+}
+
 } // namespace gw
