@@ -129,6 +129,20 @@ TEST(PictureFiles, FormatsKeepPixelsAndResolution)
     }
 }
 
+TEST(PictureFiles, KeepAlphaWhereTheFormatHasIt)
+{
+    const CTempFolder folder;
+    for (const char* name : {"a.png", "a.tga", "a.tif", "a.bmp"})
+    {
+        const uint8_t pixel[4] = {200, 100, 50, 7};
+        const Ref<CImage> image = new CImage;
+        image->Pixels().Create(5, 5, 0, pixel);
+        ASSERT_TRUE(image->Save(folder.Path(name), 95));
+        ASSERT_TRUE(image->Load(folder.Path(name)));
+        EXPECT_EQ(std::memcmp(CPixelView(image->Pixels()).Row(4), pixel, 4), 0) << name;
+    }
+}
+
 TEST(PictureFiles, WhatAFileBeginsWithTellsMoreThanItsName)
 {
     const CTempFolder folder;

@@ -81,13 +81,23 @@ std::vector<Magick::Image> ReadFrames(const Magick::Blob& blob, const char* form
     return frames;
 }
 
+// What a picture without alpha has in its place may be anything.
+void MakeOpaque(uint8_t* pixels, size_t count)
+{
+    for (uint8_t* alpha = pixels + 3; count > 0; --count, alpha += 4)
+        *alpha = 255;
+}
+
 bool HandOver(Magick::Image& image, const CPictureSink& sink)
 {
     const CPictureHead head = HeadOf(image);
     uint8_t* const pixels = head.width > 0 && head.height > 0 ? sink(head) : nullptr;
-    if (pixels)
-        image.write(0, 0, image.columns(), image.rows(), "BGRA", Magick::CharPixel, pixels);
-    return pixels != nullptr;
+    if (!pixels)
+        return false;
+    image.write(0, 0, image.columns(), image.rows(), "BGRA", Magick::CharPixel, pixels);
+    if (!image.matte())
+        MakeOpaque(pixels, image.columns() * image.rows());
+    return true;
 }
 
 bool DecodeFrames(std::span<const std::byte> file, const char* format, bool everyFrame,
