@@ -7,10 +7,11 @@
 #include "Text.h"
 
 #include <algorithm>
-#include <cstring>
 #include <optional>
 
 #include <dlfcn.h>
+
+using namespace std::string_view_literals;
 
 namespace gw {
 
@@ -52,14 +53,14 @@ struct CBeginningRow
     const char* format;
 };
 constexpr CBeginningRow kBeginnings[] = {
-    {"BM",                     "BMP" },
-    {"GIF8",                   "GIF" },
-    {"\xff\xd8\xff",           "JPEG"},
-    {"\x89PNG\r\n",            "PNG" },
-    {std::string_view("II*\0", 4),     "TIFF"},
-    {std::string_view("MM\0*",                        4),       "TIFF"},
-    {"DDS ",                  "DDS"                 },
-    {"8BPS",  "PSD"},
+    {"BM"sv,           "BMP" },
+    {"GIF8"sv,         "GIF" },
+    {"\xff\xd8\xff"sv, "JPEG"},
+    {"\x89PNG\r\n"sv,  "PNG" },
+    {"II*\0"sv,        "TIFF"},
+    {"MM\0*"sv,        "TIFF"},
+    {"DDS "sv,         "DDS" },
+    {"8BPS"sv,         "PSD" },
 };
 
 const char* FormatOfExtension(std::string_view extension)
@@ -115,15 +116,17 @@ bool DecodeOne(std::span<const std::byte> file, const char* format, CPixelBuffer
     return good;
 }
 
-// Rows without gaps, which is how the codec wants them.
-std::vector<uint8_t> PackRows(const CPixelBuffer& pixels, const CPixelView& view)
+// Rows without gaps, which is how the codec wants them: as they are, or packed into `packed`.
+const uint8_t* DenseRows(const CPixelBuffer& pixels, const CPixelView& view, std::vector<uint8_t>& packed)
 {
-    const size_t rowBytes =
-        static_cast<size_t>(pixels.GetWidth()) * static_cast<size_t>(pixels.GetBytesPerPixel());
-    std::vector<uint8_t> rows(rowBytes * static_cast<size_t>(pixels.GetHeight()));
+    const auto pixelBytes = static_cast<size_t>(pixels.GetBytesPerPixel());
+    const size_t rowBytes = static_cast<size_t>(pixels.GetWidth()) * pixelBytes;
+    if (rowBytes == pixels.GetStride())
+        return view.Row(0);
+    packed.reserve(rowBytes * static_cast<size_t>(pixels.GetHeight()));
     for (int32_t y = 0; y < pixels.GetHeight(); ++y)
-        std::memcpy(rows.data() + static_cast<size_t>(y) * rowBytes, view.Row(y), rowBytes);
-    return rows;
+        packed.insert(packed.end(), view.Row(y), view.Row(y) + rowBytes);
+    return packed.data();
 }
 
 } // namespace
@@ -166,7 +169,8 @@ bool EncodePicture(const CPixelBuffer& pixels, std::string_view extension, int32
                             .height = layout.m_iHeight,
                             .horizontalResolution = layout.m_iHorizontalResolution,
                             .verticalResolution = layout.m_iVerticalResolution};
-    return codec && codec->Encode(head, PackRows(pixels, view).data(), pixels.GetBytesPerPixel(), format,
+    std::vector<uint8_t> packed;
+    return codec && codec->Encode(head, DenseRows(pixels, view, packed), pixels.GetBytesPerPixel(), format,
                                   quality, file);
 }
 

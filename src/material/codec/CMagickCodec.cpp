@@ -139,6 +139,8 @@ void EncodeFrame(const CPictureHead& head, const uint8_t* pixels, int32_t bytesP
 class CMagickCodec : public CPictureCodec
 {
 public:
+    CMagickCodec() { Initialize(); }
+
     bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame,
                 const CPictureSink& sink) override
     try
@@ -168,6 +170,5 @@ public:
 extern "C" gw::CPictureCodec* gw_picture_codec()
 {
     static gw::CMagickCodec codec;
-    static const bool ready = (gw::Initialize(), true);
-    return ready ? &codec : nullptr;
+    return &codec;
 }
