@@ -8,6 +8,9 @@
 #include "CStandardMaterial.h"
 #include "CTextureMap.h"
 
+#include <algorithm>
+#include <cstring>
+
 namespace gw {
 
 /// An image that is stored plainly, with every pixel of its own.
@@ -81,6 +84,41 @@ inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::
     multi->m_kSubMaterials[0] = material.Get();
     multi->m_kSubMaterials[1] = blend.Get();
     return multi.Get();
+}
+
+/// A picture of 16 x 8 pixels that is blue on the left and orange on the right, which JPEG keeps well.
+inline void DrawHalves(CPixelBuffer& pixels, int32_t format = 0)
+{
+    const uint8_t blue[4] = {250, 20, 10, 255};
+    const uint8_t orange[4] = {10, 120, 240, 255};
+    pixels.Create(16, 8, format, blue);
+    const CPixelLock lock(pixels);
+    for (int32_t y = 0; y < 8; ++y)
+    {
+        for (int32_t x = 8; x < 16; ++x)
+            std::memcpy(lock.Row(y) + x * pixels.GetBytesPerPixel(), orange,
+                        size_t(pixels.GetBytesPerPixel()));
+    }
+}
+
+inline Ref<CImage> Halves(int32_t format = 0)
+{
+    Ref<CImage> image = new CImage;
+    DrawHalves(image->Pixels(), format);
+    return image;
+}
+
+inline bool ShowsHalves(CImage& image, int tolerance)
+{
+    const CPixelBuffer& pixels = image.Pixels();
+    const CPixelView view(pixels);
+    if (pixels.GetWidth() != 16 || pixels.GetHeight() != 8 || pixels.GetFormat() != 0)
+        return false;
+    const auto isNear = [&](int32_t x, std::initializer_list<int> color) {
+        const uint8_t* byte = view.Row(5) + x * 4;
+        return std::ranges::all_of(color, [&](int c) { return std::abs(*byte++ - c) <= tolerance; });
+    };
+    return isNear(2, {250, 20, 10, 255}) && isNear(13, {10, 120, 240, 255});
 }
 
 } // namespace gw
