@@ -3,31 +3,11 @@
 #include "CFieldArchive.h"
 #include "CSpatial.h"
 
-#include <algorithm>
-#include <cmath>
-
 namespace gw {
 
 const CRTTI CKeyframeControl::ms_kRTTI{"CKeyframeControl", &CControl::ms_kRTTI};
 
 namespace {
-
-using KeySpan = CKeyframeControl::KeySpan;
-
-// Files may hold fewer keys than times: the last key stands in for those that are missing.
-template <class T>
-const T& KeyAt(const std::vector<T>& keys, uint32_t index)
-{
-    return keys[std::min<size_t>(index, keys.size() - 1)];
-}
-
-Vec3 LinearKey(const std::vector<Vec3>& keys, const KeySpan& span, const Vec3& empty)
-{
-    if (keys.empty())
-        return empty;
-    const Vec3& a = KeyAt(keys, span.a);
-    return span.fraction == 0.0f ? a : a + (KeyAt(keys, span.b) - a) * span.fraction;
-}
 
 Mat3 RotationKey(const std::vector<Quat>& keys, const KeySpan& span)
 {
@@ -35,12 +15,6 @@ Mat3 RotationKey(const std::vector<Quat>& keys, const KeySpan& span)
         return kMat3Identity;
     const Quat& a = KeyAt(keys, span.a);
     return QuatToMat3(span.fraction == 0.0f ? a : QuatSlerp(span.fraction, a, KeyAt(keys, span.b)));
-}
-
-KeySpan Between(float time, const std::vector<float>& times, uint32_t a, uint32_t b)
-{
-    const float fraction = (time - times[a]) / (times[b] - times[a]);
-    return {std::isfinite(fraction) ? fraction : 0.0f, a, b};
 }
 
 } // namespace
@@ -80,33 +54,6 @@ uint64_t CKeyframeControl::GetMemoryUsed() const
 bool CKeyframeControl::Update(float)
 {
     return false;
-}
-
-CKeyframeControl::KeySpan CKeyframeControl::FindKeys(float time, const std::vector<float>& times,
-                                                     Cursor& cursor)
-{
-    const uint32_t last = static_cast<uint32_t>(times.size()) - 1;
-    if (!(time > times[0]))
-        return {0.0f, cursor = 0, 0};
-    if (time >= times[last])
-        return {0.0f, cursor = last, last};
-    uint32_t i = std::min(cursor, last);
-    // The bounds on j hold by themselves on an ascending axis; a file's axis may be none.
-    if (time > times[i])
-    {
-        uint32_t j = i + 1;
-        for (; j < last && time >= times[j]; ++j)
-            i = j;
-        cursor = i;
-        return Between(time, times, i, std::min(j, last));
-    }
-    if (time == times[i])
-        return {0.0f, i, i};
-    uint32_t j = i > 0 ? i - 1 : 0;
-    for (; j > 0 && time <= times[j]; --j)
-        i = j;
-    cursor = i;
-    return Between(time, times, j, i);
 }
 
 void CKeyframeControl::GetPose(float time, Mat3& rotation, Vec3& position, Vec3& scale)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CControl.h"
+#include "KeySpan.h"
 #include "Mat4.h"
 #include "Quat.h"
 #include "Vec3.h"
@@ -32,18 +33,6 @@ public:
     bool Update(float time) override;
     bool UpdateTransform(float time) override;
 
-    /// A search position on a time axis that stays where it was, so that sequential play costs one compare or
-    /// two.
-    using Cursor = uint32_t;
-    /// The keys around a key time: t lies at `fraction` between indices a and b. The axis must not be empty.
-    struct KeySpan
-    {
-        float fraction;
-        uint32_t a;
-        uint32_t b;
-    };
-    static KeySpan FindKeys(float time, const std::vector<float>& times, Cursor& cursor);
-
     /// The pose at a caller's time. Empty tracks give the identity, the origin and (1, 1, 1).
     void GetPose(float time, Mat3& rotation, Vec3& position, Vec3& scale);
 
@@ -63,10 +52,10 @@ public:
 private:
     void CancelParent(CSpatial& target, float time);
 
-    Cursor m_uiKeyCursor = 0;
-    Cursor m_uiRotationCursor = 0;
-    Cursor m_uiPositionCursor = 0;
-    Cursor m_uiScaleCursor = 0;
+    KeyCursor m_uiKeyCursor = 0;
+    KeyCursor m_uiRotationCursor = 0;
+    KeyCursor m_uiPositionCursor = 0;
+    KeyCursor m_uiScaleCursor = 0;
 };
 
 } // namespace gw

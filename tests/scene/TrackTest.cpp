@@ -91,11 +91,11 @@ TEST(FindKeys, AnyOrderOfPlayFindsTheSameSpan)
     play.insert(play.end(), back.begin(), back.end());
     for (const float time : {17.0f, 3.0f, 40.0f, -1.0f, 8.0f, 32.0f, 1.0f, 8.0f, 8.0f})
         play.push_back(time);
-    CKeyframeControl::Cursor cursor = 0;
+    KeyCursor cursor = 0;
     for (const float time : play)
     {
         SCOPED_TRACE(time);
-        const auto span = CKeyframeControl::FindKeys(time, times, cursor);
+        const auto span = FindKeys(time, times, cursor);
         ASSERT_LT(span.b, times.size());
         ASSERT_LT(cursor, times.size());
         EXPECT_FLOAT_EQ(times[span.a] + span.fraction * (times[span.b] - times[span.a]),
@@ -124,8 +124,8 @@ TEST(FindKeys, OnTheKeyWhereTheCursorStandsThereIsNoFraction)
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.what);
-        CKeyframeControl::Cursor cursor = row.cursorBefore;
-        const auto span = CKeyframeControl::FindKeys(row.time, times, cursor);
+        KeyCursor cursor = row.cursorBefore;
+        const auto span = FindKeys(row.time, times, cursor);
         EXPECT_EQ(span.a, row.a);
         EXPECT_EQ(span.b, row.b);
         EXPECT_EQ(span.fraction, row.fraction);
