@@ -31,6 +31,13 @@ uint64_t CControl::GetMemoryUsed() const
     return CObject::GetMemoryUsed() + 32;
 }
 
+// The copy has no target until it is attached.
+void CControl::CloneHeld(CCloneMap& map, CObject& copy)
+{
+    CObject::CloneHeld(map, copy);
+    static_cast<CControl&>(copy).SetTarget(nullptr);
+}
+
 bool CControl::UpdateRange(uint32_t, float time)
 {
     return Update(time);

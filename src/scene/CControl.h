@@ -52,6 +52,9 @@ public:
     float m_fPhase = 0.0f; ///< added after the multiplication
     bool m_bActive = true; ///< an inactive control does not animate
 
+protected:
+    void CloneHeld(CCloneMap& map, CObject& copy) override;
+
 private:
     float CycledTime(float s) const;
 

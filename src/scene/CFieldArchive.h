@@ -83,7 +83,7 @@ public:
     CObject* Get() const { return m_pkGet(m_pkSlot); }
     /// An object of another class than the slot's becomes null.
     void Set(CObject* object) const { m_pkSet(m_pkSlot, object); }
-    /// Whether the slot keeps its object alive. Only such links are registered, followed and cloned.
+    /// Whether the slot keeps its object alive. Only such links are registered and followed.
     bool IsCounted() const { return m_bCounted; }
 
 private:
@@ -258,7 +258,7 @@ void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
     EndArray();
 }
 
-/// Shows every counted link to a function, in file order, and passes over everything else.
+/// Shows every link to a function, in file order, and passes over everything else.
 template <class F>
 class CLinkVisitor : public CFieldArchive
 {
@@ -271,11 +271,7 @@ public:
 
 protected:
     void Values(const char*, EFieldKind, void*, size_t) override {}
-    void Slot(const char*, const CLinkSlot& slot) override
-    {
-        if (slot.IsCounted())
-            m_kVisit(slot);
-    }
+    void Slot(const char*, const CLinkSlot& slot) override { m_kVisit(slot); }
 
 private:
     F m_kVisit;

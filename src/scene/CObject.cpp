@@ -19,12 +19,24 @@ namespace {
 
 constexpr size_t kChainCount = 3;
 
-std::vector<CLinkSlot> HeldSlots(CObject& object)
+std::vector<CLinkSlot> LinkSlots(CObject& object)
 {
     std::vector<CLinkSlot> slots;
     CLinkVisitor visitor([&](const CLinkSlot& slot) { slots.push_back(slot); });
     object.Fields(visitor);
     return slots;
+}
+
+// Plain links of a copy lead to the copies of what they led to. What was not cloned stays where it is.
+void FollowCopies(CObject& copy, const CCloneMap& map)
+{
+    CLinkVisitor visitor([&](const CLinkSlot& slot) {
+        const CObject* object = slot.IsCounted() ? nullptr : slot.Get();
+        const auto found = object ? map.find(object->GetID()) : map.end();
+        if (found != map.end())
+            slot.Set(found->second);
+    });
+    copy.Fields(visitor);
 }
 
 CObject* CloneOf(CCloneMap& map, CObject* object)
@@ -114,8 +126,12 @@ CObject* CObject::Clone(CCloneMap& map)
     CObject* copy = CreateClone();
     if (!copy)
         return nullptr;
+    const bool isOutermost = map.empty();
     map[m_uiID] = copy;
     CloneHeld(map, *copy);
+    // What a plain link leads to may be cloned long after it.
+    for (auto entry = map.begin(); isOutermost && entry != map.end(); ++entry)
+        FollowCopies(*entry->second, map);
     return copy;
 }
 
@@ -130,10 +146,10 @@ void CObject::CloneHeld(CCloneMap& map, CObject& copy)
 
     // What comes behind the chains stands at the same place in both lists. A class whose copy starts with
     // fewer slots (a node without children) fills in the rest itself.
-    const std::vector<CLinkSlot> from = HeldSlots(*this);
-    const std::vector<CLinkSlot> to = HeldSlots(copy);
+    const std::vector<CLinkSlot> from = LinkSlots(*this);
+    const std::vector<CLinkSlot> to = LinkSlots(copy);
     for (size_t i = kChainCount; i < to.size() && i < from.size(); ++i)
-        to[i].Set(CloneOf(map, from[i].Get()));
+        to[i].Set(from[i].IsCounted() ? CloneOf(map, from[i].Get()) : from[i].Get());
 }
 
 void CObject::Fields(CFieldArchive& archive)
@@ -207,7 +223,8 @@ std::vector<CObject*> CObject::HeldObjects()
 {
     std::vector<CObject*> held;
     CLinkVisitor visitor([&](const CLinkSlot& slot) {
-        if (CObject* object = slot.Get())
+        CObject* object = slot.IsCounted() ? slot.Get() : nullptr;
+        if (object)
             held.push_back(object);
     });
     Fields(visitor);
@@ -259,6 +276,7 @@ bool CObject::Rebind(const CCloneMap& map)
 {
     for (CObject* held : BindOrder())
         held->Rebind(map);
+    FollowCopies(*this, map);
     return true;
 }
 

@@ -49,6 +49,7 @@ public:
     /// A new object by the copy constructor, with count 0; null for abstract classes.
     virtual CObject* CreateClone() const { return nullptr; }
     /// A copy with copies of all that it holds; an object that the map knows gives the copy made before.
+    /// Plain links of the copies lead to copies where there are any.
     CObject* Clone(CCloneMap& map);
 
     /// The class's stored fields, base first, in file order: the one place that says what a file holds.
@@ -81,7 +82,7 @@ public:
     std::vector<CObject*> HeldObjects();
     /// Lets references by name look up their objects under a root.
     virtual bool Bind(CObject& root);
-    /// Lets plain references of a finished copy point at the copies.
+    /// Lets plain links of a finished copy lead to copies that a later clone with the same map has made.
     virtual bool Rebind(const CCloneMap& map);
 
     const char* GetName() const { return m_pcName.Get(); }

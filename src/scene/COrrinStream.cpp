@@ -87,7 +87,10 @@ private:
 // Empties every counted slot of an object, so that a graph that must not stand falls apart without recursion.
 void Unlink(CObject& object)
 {
-    CLinkVisitor visitor([](const CLinkSlot& slot) { slot.Set(nullptr); });
+    CLinkVisitor visitor([](const CLinkSlot& slot) {
+        if (slot.IsCounted())
+            slot.Set(nullptr);
+    });
     object.Fields(visitor);
 }
 

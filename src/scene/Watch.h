@@ -5,16 +5,30 @@
 namespace gw {
 
 /// A plain pointer of one scene object to another that holds no count and becomes null when the other dies.
-/// Like Held it is not copied with its holder.
+/// Like Held it is not copied with its holder; cloning hands it on. It moves, so that arrays of it may grow.
 template <class T>
 class Watch
 {
 public:
     Watch() = default;
     Watch(const Watch&) {}
+    Watch(Watch&& other) noexcept
+    {
+        Set(other.Get());
+        other.Set(nullptr);
+    }
     Watch& operator=(const Watch& other)
     {
         Set(other.Get());
+        return *this;
+    }
+    Watch& operator=(Watch&& other) noexcept
+    {
+        if (this != &other)
+        {
+            Set(other.Get());
+            other.Set(nullptr);
+        }
         return *this;
     }
     ~Watch() = default;
