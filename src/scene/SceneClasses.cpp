@@ -1,8 +1,10 @@
 #include "CCamera.h"
+#include "CCameraControl.h"
 #include "CCustomData.h"
 #include "CFactoryMap.h"
 #include "CKeyframeClipControl.h"
 #include "CLight.h"
+#include "CLightControl.h"
 #include "CNode.h"
 #include "COrrinStream.h"
 
@@ -21,6 +23,8 @@ constexpr CFactoryRow kClasses[] = {
     {&CControl::ms_kRTTI,             MakeNothing                     },
     {&CKeyframeControl::ms_kRTTI,     MakeObject<CKeyframeControl>    },
     {&CKeyframeClipControl::ms_kRTTI, MakeObject<CKeyframeClipControl>},
+    {&CLightControl::ms_kRTTI,        MakeObject<CLightControl>       },
+    {&CCameraControl::ms_kRTTI,       MakeObject<CCameraControl>      },
     {&CModifier::ms_kRTTI,            MakeNothing                     },
     {&CBillboardNode::ms_kRTTI,       MakeObject<CBillboardNode>      },
     {&CCustomData::ms_kRTTI,          MakeNothing                     },
