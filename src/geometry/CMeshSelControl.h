@@ -1,0 +1,24 @@
+#pragma once
+
+#include "CBitArray.h"
+#include "CControl.h"
+
+namespace gw {
+
+/// A selection on a mesh, kept for others; it changes nothing.
+class CMeshSelControl : public CControl
+{
+public:
+    static const CRTTI ms_kRTTI;
+
+    const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
+    CObject* CreateClone() const override { return new CMeshSelControl(*this); }
+    void Fields(CFieldArchive& archive) override;
+    uint64_t GetMemoryUsed() const override;
+    bool Update(float) override { return false; }
+    bool UpdateTransform(float) override { return false; }
+
+    CBitArray m_kSelection;
+};
+
+} // namespace gw
