@@ -1,0 +1,139 @@
+#include "CSkinBoneControl.h"
+
+#include "CFieldArchive.h"
+#include "CGeometry.h"
+#include "SkinBones.h"
+
+#include <algorithm>
+
+namespace gw {
+
+const CRTTI CSkinBoneControl::ms_kRTTI{"CSkinBoneControl", &CControl::ms_kRTTI};
+
+namespace {
+
+// Where points are put together; shared by all skins of the process and kept between updates.
+std::vector<Vec3>& Scratch(size_t count)
+{
+    static std::vector<Vec3> scratch;
+    scratch.resize(std::max(scratch.size(), count));
+    std::ranges::fill(scratch, kVec3Zero);
+    return scratch;
+}
+
+} // namespace
+
+CSkinBoneControl::CSkinBoneControl() = default;
+CSkinBoneControl::CSkinBoneControl(const CSkinBoneControl& source) = default;
+CSkinBoneControl::~CSkinBoneControl() = default;
+
+CObject* CSkinBoneControl::CreateClone() const
+{
+    return new CSkinBoneControl(*this);
+}
+
+void CSkinBoneControl::Fields(CFieldArchive& archive)
+{
+    CControl::Fields(archive);
+    archive.Array("m_kPoints", m_kPoints, [](CFieldArchive& points, Point& point) {
+        points.Unsigned("m_uiIndex", point.m_uiIndex);
+        points.Array("m_kEntries", point.m_kEntries, [](CFieldArchive& entries, Entry& entry) {
+            entries.PlainLink("m_pkBone", entry.m_pkBone);
+            entries.Float("m_fWeight", entry.m_fWeight);
+            entries.Matrix("m_kOffset", entry.m_kOffset);
+        });
+    });
+}
+
+uint64_t CSkinBoneControl::GetMemoryUsed() const
+{
+    uint64_t bytes = CControl::GetMemoryUsed() + 12;
+    for (const Point& point : m_kPoints)
+        bytes += 16 + point.m_kEntries.size() * 72;
+    return bytes;
+}
+
+CSkinBoneControl::Point& CSkinBoneControl::PointOf(uint32_t index)
+{
+    if (m_kPlaces.empty())
+    {
+        for (size_t place = 0; place < m_kPoints.size(); ++place)
+            m_kPlaces.emplace(m_kPoints[place].m_uiIndex, place);
+    }
+    const auto [known, isNew] = m_kPlaces.emplace(index, m_kPoints.size());
+    if (isNew)
+        m_kPoints.emplace_back().m_uiIndex = index;
+    return m_kPoints[known->second];
+}
+
+void CSkinBoneControl::AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset)
+{
+    std::vector<Entry>& entries = PointOf(point).m_kEntries;
+    Entry& entry = *entries.emplace(entries.begin());
+    entry.m_pkBone.Set(&bone);
+    entry.m_fWeight = weight;
+    entry.m_kOffset = offset;
+}
+
+bool CSkinBoneControl::Bind(CObject& root)
+{
+    CControl::Bind(root);
+    CBonesByName bones(root);
+    const std::vector<Point> old = std::exchange(m_kPoints, {});
+    m_kPlaces.clear();
+    for (const Point& point : old)
+    {
+        for (const Entry& entry : point.m_kEntries)
+        {
+            if (CSpatial* bone = bones.Find(entry.m_pkBone.Get()))
+                AddInfluence(*bone, point.m_uiIndex, entry.m_fWeight, entry.m_kOffset);
+        }
+    }
+    return true;
+}
+
+bool CSkinBoneControl::Rebind(const CCloneMap& map)
+{
+    CControl::Rebind(map);
+    const CCopies copies(map);
+    for (Point& point : m_kPoints)
+        std::erase_if(point.m_kEntries,
+                      [&](const Entry& entry) { return !copies.Contains(entry.m_pkBone.Get()); });
+    return true;
+}
+
+Vec3 CSkinBoneControl::Blend(const Point& point, const Vec3& model) const
+{
+    Vec3 sum = kVec3Zero;
+    for (const Entry& entry : point.m_kEntries)
+    {
+        if (!entry.m_pkBone)
+            continue;
+        const Vec3 inBone = TransformCoord(model, entry.m_kOffset);
+        sum = sum + TransformCoord(inBone, entry.m_pkBone->m_kWorldMatrix) * entry.m_fWeight;
+    }
+    return sum;
+}
+
+bool CSkinBoneControl::Update(float)
+{
+    CGeometry* target = RecordCast<CGeometry>(GetTarget());
+    if (!m_bActive || !target)
+        return false;
+    if (!target->m_bWorldValid)
+        target->UpdateWorldPoints();
+    const std::span<Vec3> points = target->WorldXYZBuffer();
+    const Mat4 toModel = Mat4InverseOrIdentity(target->m_kWorldMatrix);
+    std::vector<Vec3>& moved = Scratch(points.size());
+    for (const Point& point : m_kPoints)
+    {
+        if (point.m_uiIndex < points.size())
+            moved[point.m_uiIndex] =
+                moved[point.m_uiIndex] + Blend(point, TransformCoord(points[point.m_uiIndex], toModel));
+    }
+    std::copy_n(moved.begin(), points.size(), points.begin());
+    ++target->m_uiChangeStamp;
+    return true;
+}
+
+} // namespace gw
