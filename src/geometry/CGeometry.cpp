@@ -3,6 +3,8 @@
 #include "CFieldArchive.h"
 #include "CMaterialBase.h"
 
+#include <algorithm>
+
 namespace gw {
 
 const CRTTI CGeometry::ms_kRTTI{"CGeometry", &CSpatial::ms_kRTTI};
@@ -133,6 +135,11 @@ bool CGeometry::CreateXYZMtl()
 {
     m_kXYZMtl.assign(m_kXYZ.size(), 0);
     return !m_kXYZMtl.empty();
+}
+
+void CGeometry::GrowWorldPoints(size_t count)
+{
+    m_kWorldXYZ.resize(std::max(m_kWorldXYZ.size(), count), kVec3Zero);
 }
 
 void CGeometry::SetVertexCount(size_t count, bool points, bool normals, bool colors)

@@ -74,6 +74,8 @@ protected:
     CGeometry(const CGeometry& source);
     void CloneHeld(CCloneMap& map, CObject& copy) override;
     void AppendBindOrder(std::vector<CObject*>& order) override;
+    /// Gives the world at least so many points, for a class that writes them itself.
+    void GrowWorldPoints(size_t count);
     /// Sizes the index lists of the render vertices: those asked for get `count` entries, the others none.
     void SetVertexCount(size_t count, bool points, bool normals, bool colors);
 
