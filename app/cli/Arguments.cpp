@@ -26,6 +26,14 @@ bool ScanInteger(std::string_view text, T& number)
     return error == std::errc() && end == text.data() + text.size();
 }
 
+// The same for a number that 32 bits hold.
+bool ScanNumber(std::string_view text, float& number)
+{
+    ENumber kind = ENumber::None;
+    number = static_cast<float>(ParseDouble(text, kind));
+    return kind == ENumber::Whole && std::isfinite(number);
+}
+
 // Tells the parser of an option, by what its value is.
 class OptionBinder
 {
@@ -63,10 +71,15 @@ public:
     CLI::Option* operator()(float COptions::*target) const
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
-            ENumber kind = ENumber::None;
-            *number = static_cast<float>(ParseDouble(text, kind));
-            if (kind != ENumber::Whole || !(*number > 0.0f) || !std::isfinite(*number))
+            if (!ScanNumber(text, *number) || !(*number > 0.0f))
                 throw CLI::ValidationError(Quoted(text) + " is no number above 0");
+        });
+    }
+    CLI::Option* operator()(std::optional<float> COptions::*target) const
+    {
+        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+            if (!ScanNumber(text, number->emplace()))
+                throw CLI::ValidationError(Quoted(text) + " is no number");
         });
     }
 
@@ -110,6 +123,15 @@ void AddOptions(CLI::App& app, const CCommand& command, COptions& options)
     }
     app.add_option("files", options.files);
     app.allow_extras();
+}
+
+// How many of the options of which one must be there a command line has.
+size_t CountChosen(const CLI::App& app, const CCommand& command)
+{
+    size_t chosen = 0;
+    for (const COptionRow& row : OptionTable())
+        chosen += command.choice & row.bit && app.count(std::string(row.names)) > 0 ? 1 : 0;
+    return chosen;
 }
 
 // All forms of the options that a command takes: "-o", "--output", ...
@@ -182,6 +204,8 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
         return RefuseUnknown(command, *option);
     if (!wrong.empty())
         return RefuseFor(command, Printable(wrong));
+    if (command.choice && CountChosen(app, command) != 1)
+        return RefuseFor(command, std::string(command.name) + " needs one of " + ChoiceText(command));
     if (options.files.size() < LeastOperands(command))
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
     if (options.files.size() > MostOperands(command))

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <optional>
 #include <string>
 #include <vector>
 
@@ -33,6 +34,7 @@ struct COptions
     std::string dataFolder;   ///< replaces the folder beside the executable; empty for that
     std::string job;          ///< htr or orn
     int64_t frame = 0;
+    std::optional<float> time; ///< --time, in place of a frame; in the unit of the file's controls
     std::string with;  ///< the motion to draw beside the first one; empty for none
     int64_t strip = 1; ///< number of poses
     CPixelSize size;
@@ -46,6 +48,7 @@ struct COptions
     bool dryRun = false;       ///< say what would be done
     bool noLegs = false;       ///< leave the feet to the plain rotation transfer
     bool keepGoing = false;    ///< go on behind a source that failed
+    bool objects = false;      ///< tell all spatial objects, not nodes alone
 };
 
 } // namespace gw

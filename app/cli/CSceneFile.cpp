@@ -84,10 +84,7 @@ std::vector<CFoundNode> CSceneFile::Nodes() const
 // The save list has every object once, in the order in which FindObject would meet it.
 const CKeyframeControl* CSceneFile::FirstTrack()
 {
-    if (!m_bContainer)
-        return RecordCast<CKeyframeControl>(
-            m_kMotion.motionRoot->FindObject(nullptr, &CKeyframeControl::ms_kRTTI, true));
-    const std::vector<CObject*> objects = m_kScene.ObjectsInSaveOrder();
+    const std::vector<CObject*> objects = Objects();
     const auto isTrack = [](const CObject* object) {
         return IsDerivedFrom(*object, &CKeyframeControl::ms_kRTTI);
     };
@@ -95,10 +92,23 @@ const CKeyframeControl* CSceneFile::FirstTrack()
     return track == objects.end() ? nullptr : static_cast<const CKeyframeControl*>(*track);
 }
 
-void CSceneFile::Update(int64_t frame)
+std::vector<CObject*> CSceneFile::Objects()
+{
+    if (m_bContainer)
+        return m_kScene.ObjectsInSaveOrder();
+    COrrinStream motion;
+    motion.AddRoot(m_kMotion.motionRoot.Get());
+    return motion.ObjectsInSaveOrder();
+}
+
+float CSceneFile::TimeOf(int64_t frame)
 {
     const CKeyframeControl* track = FirstTrack();
-    const float time = track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
+    return track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
+}
+
+void CSceneFile::Update(float time)
+{
     for (CObject* root : Roots())
     {
         if (CSpatial* spatial = RecordCast<CSpatial>(root))

@@ -43,8 +43,12 @@ public:
     std::vector<CFoundNode> Nodes() const;
     /// The first track, whose clock counts for the whole file; null where there is none.
     const CKeyframeControl* FirstTrack();
-    /// Brings everything to a frame of the first track.
-    void Update(int64_t frame);
+    /// The time at which the first track reaches a frame.
+    float TimeOf(int64_t frame);
+    /// Brings one root after the other to a time.
+    void Update(float time);
+    /// All objects that the roots hold, in save order.
+    std::vector<CObject*> Objects();
 
 private:
     std::vector<CObject*> Roots() const;

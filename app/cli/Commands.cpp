@@ -8,9 +8,10 @@ namespace {
 
 // Rows are calls, which the formatter leaves as they are read.
 constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_t options, uint32_t required,
-                       EExit (*run)(const COptions&), std::string_view help, std::string_view example)
+                       EExit (*run)(const COptions&), std::string_view help, std::string_view example,
+                       uint32_t choice = 0)
 {
-    return {name, operands, options, required, run, help, example};
+    return {name, operands, options, required, run, help, example, choice};
 }
 
 constexpr uint32_t kConvertOptions =
@@ -31,10 +32,11 @@ constexpr CCommand kCommands[] = {
     Row("info", "FILE", 0, 0, RunInfo,
         "Show what a motion or a container holds: format, frames, rate, bones, objects.",
         "gaitwright info walk.bvh"),
-    Row("pose", "FILE", kFrame, kFrame, RunPose,
-        "Print the local and world matrix of every node at a frame, as JSON.\n"
-        "Row vectors, row by row. A frame behind the end gives the pose of the end.",
-        "gaitwright pose walk.bvh --frame 30"),
+    Row("pose", "FILE", kFrame | kTime | kObjects, 0, RunPose,
+        "Print the local and world matrix of every node at a frame or a time, as JSON.\n"
+        "Row vectors, row by row. A frame behind the end gives the pose of the end. With --objects all that\n"
+        "has a place is told: bounds, points, normals, texture coordinates, cameras and lights.",
+        "gaitwright pose walk.bvh --frame 30", kFrame | kTime),
     Row("transcode", "IN OUT", kFrameScale | kForce, 0, RunTranscode,
         "Write an .htr with more or fewer frames, or any motion as a .bvh.",
         "gaitwright transcode walk.htr slow.htr --frame-scale 2"),

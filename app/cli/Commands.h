@@ -29,6 +29,8 @@ enum EOption : uint32_t
     kWith = 1u << 15,
     kStrip = 1u << 16,
     kSize = 1u << 17,
+    kTime = 1u << 18,
+    kObjects = 1u << 19,
 };
 
 /// One command of the program.
@@ -41,6 +43,7 @@ struct CCommand
     EExit (*run)(const COptions& options);
     std::string_view help; ///< the first line stands in the list of commands
     std::string_view example;
+    uint32_t choice; ///< of these exactly one must be there; 0 for no such choice
 };
 
 /// How many operands a command takes.

@@ -21,6 +21,8 @@ constexpr COptionRow kOptions[] = {
     Row(kJob, "--job", "htr|orn", &COptions::job, "htr converts every .bvh, orn packages every .htr",
         "htr|orn"),
     Row(kFrame, "--frame", "N", &COptions::frame, "the number of the frame, from 0 on"),
+    Row(kTime, "--time", "T", &COptions::time, "a time as the controls of the file count it; may be below 0"),
+    Row(kObjects, "--objects", "", &COptions::objects, "all objects with a place, and not nodes alone"),
     Row(kSize, "--size", "WxH", &COptions::size, "width and height in pixels, 640x480 unless told"),
     Row(kWith, "--with", "RESULT", &COptions::with,
         "the motion to draw beside it, at the same share of its length"),
@@ -82,7 +84,23 @@ std::string UsageLine(const CCommand& command)
         if (command.required & row.bit)
             line += ' ' + Shown(row, row.names.substr(0, row.names.find(',')));
     }
+    if (command.choice)
+        line += ' ' + ChoiceText(command);
     return line + " [OPTIONS]";
+}
+
+std::string ChoiceText(const CCommand& command)
+{
+    std::string text;
+    for (const COptionRow& row : kOptions)
+    {
+        if (!(command.choice & row.bit))
+            continue;
+        if (!text.empty())
+            text += " | ";
+        text += Shown(row, row.names);
+    }
+    return text;
 }
 
 std::string ProgramHelp()

@@ -7,10 +7,11 @@
 
 namespace gw {
 
-/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, an integer,
-/// a size.
-using COptionTarget = std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
-                                   int64_t COptions::*, CPixelSize COptions::*>;
+/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, any number,
+/// an integer, a size.
+using COptionTarget =
+    std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
+                 std::optional<float> COptions::*, int64_t COptions::*, CPixelSize COptions::*>;
 
 /// One option of the program.
 struct COptionRow
@@ -35,5 +36,7 @@ std::string ProgramHelp();
 std::string CommandHelp(const CCommand& command);
 /// "gaitwright pose FILE --frame N [OPTIONS]".
 std::string UsageLine(const CCommand& command);
+/// The options that a command takes one of: "--frame N | --time T".
+std::string ChoiceText(const CCommand& command);
 
 } // namespace gw

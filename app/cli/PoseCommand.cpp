@@ -1,6 +1,7 @@
 #include "CJsonWriter.h"
 #include "CSceneFile.h"
 #include "Commands.h"
+#include "PosedObject.h"
 #include "Words.h"
 
 namespace gw {
@@ -21,6 +22,31 @@ void WriteNode(CJsonWriter& json, const CFoundNode& found)
     json.EndObject();
 }
 
+void WriteNodes(CJsonWriter& json, const CSceneFile& file)
+{
+    json.Key("nodes").BeginArray();
+    for (const CFoundNode& found : file.Nodes())
+    {
+        json.BreakLine();
+        WriteNode(json, found);
+    }
+    json.EndArray();
+}
+
+void WriteObjects(CJsonWriter& json, CSceneFile& file)
+{
+    json.Key("objects").BeginArray();
+    for (CObject* object : file.Objects())
+    {
+        CSpatial* spatial = RecordCast<CSpatial>(object);
+        if (!spatial)
+            continue;
+        json.BreakLine();
+        WritePosedObject(json, *spatial);
+    }
+    json.EndArray();
+}
+
 } // namespace
 
 EExit RunPose(const COptions& options)
@@ -30,18 +56,19 @@ EExit RunPose(const COptions& options)
     if (!file.LoadWhole(path))
         return EExit::Failed;
     SayWarnings(options, path, file.Record());
-    file.Update(options.frame);
+    const float time = options.time ? *options.time : file.TimeOf(options.frame);
+    file.Update(time);
 
     CJsonWriter json(stdout);
     json.BeginObject();
-    json.Key("frame").Integer(options.frame);
-    json.Key("nodes").BeginArray();
-    for (const CFoundNode& found : file.Nodes())
-    {
-        json.BreakLine();
-        WriteNode(json, found);
-    }
-    json.EndArray();
+    if (options.time)
+        json.Key("time").Number(time);
+    else
+        json.Key("frame").Integer(options.frame);
+    if (options.objects)
+        WriteObjects(json, file);
+    else
+        WriteNodes(json, file);
     json.EndObject();
     json.EndDocument();
     return EExit::Done;
