@@ -1,0 +1,199 @@
+#include "ControlSamples.h"
+#include "SceneSamples.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <random>
+
+namespace gw {
+
+namespace {
+
+void ExpectVector(const Vec3& v, const Vec3& expected)
+{
+    EXPECT_NEAR(v.x, expected.x, 1e-4f);
+    EXPECT_NEAR(v.y, expected.y, 1e-4f);
+    EXPECT_NEAR(v.z, expected.z, 1e-4f);
+}
+
+const float kDiagonal = std::sqrt(0.5f);
+
+// Two triangles: one faces +Z, the other lies 2 to the right and faces +X.
+class TwoMeshes : public testing::Test
+{
+protected:
+    void SetUp() override
+    {
+        m_kSecond->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitY, 1.57079632f), {2, 0, 0});
+        m_kRoot->AttachChild(m_kFirst.Get());
+        m_kRoot->AttachChild(m_kSecond.Get());
+    }
+    template <class TControl, class TData>
+    void Attach(Held<TData> TControl::*data, TData* shared)
+    {
+        for (CTriMesh* mesh : {m_kFirst.Get(), m_kSecond.Get()})
+        {
+            TControl* control = new TControl;
+            control->*data = shared;
+            control->m_fEndTime = 10.0f;
+            mesh->AttachControl(control);
+        }
+    }
+    void AttachSeam()
+    {
+        m_kSeam->m_kFirst.m_pkMesh.Set(m_kFirst.Get());
+        m_kSeam->m_kSecond.m_pkMesh.Set(m_kSecond.Get());
+        m_kSeam->m_kFirst.m_kPoints = {0};
+        m_kSeam->m_kSecond.m_kPoints = {0};
+        m_kSeam->m_kFirst.m_kGroups = {
+            {0, 99}
+        };
+        m_kSeam->m_kSecond.m_kGroups = {{0}};
+        Attach(&CConnectControl::m_spkConnectData, m_kSeam.Get());
+    }
+    void AttachSmoothing(float threshold)
+    {
+        m_kSmoothing->m_fThreshold = threshold;
+        m_kSmoothing->m_kMeshes.resize(2);
+        m_kSmoothing->m_kMeshes[0].m_pkMesh.Set(m_kFirst.Get());
+        m_kSmoothing->m_kMeshes[1].m_pkMesh.Set(m_kSecond.Get());
+        for (CEditNormalData::Record& record : m_kSmoothing->m_kMeshes)
+        {
+            record.m_kNormals = CBitArray(3);
+            record.m_kNormals.Set(0);
+            record.m_kNormals.Set(1);
+        }
+        Attach(&CEditNormalControl::m_spkEditNormalData, m_kSmoothing.Get());
+    }
+    void Update(float time) { m_kRoot->UpdateScene(time, false); }
+
+    Ref<CNode> m_kRoot = new CNode;
+    Ref<CTriMesh> m_kFirst = Triangle();
+    Ref<CTriMesh> m_kSecond = Triangle();
+    Ref<CConnectData> m_kSeam = new CConnectData;
+    Ref<CEditNormalData> m_kSmoothing = new CEditNormalData;
+};
+
+} // namespace
+
+TEST_F(TwoMeshes, ASeamClosesWhenTheSecondMeshHasReachedTheTime)
+{
+    AttachSeam();
+    m_kFirst->UpdateTransform(1.0f);
+    m_kFirst->Update(1.0f);
+    EXPECT_EQ(m_kFirst->WorldXYZBuffer()[0], kVec3Zero) << "the other is not there yet";
+    const uint32_t stamp = m_kFirst->m_uiChangeStamp;
+    Update(1.0f);
+    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0});
+    ExpectVector(m_kSecond->WorldXYZBuffer()[0], {1, 0, 0});
+    ExpectVector(m_kFirst->WorldXYZBuffer()[1], {1, 0, 0});
+    for (CTriMesh* mesh : {m_kFirst.Get(), m_kSecond.Get()})
+        ExpectVector(mesh->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal});
+    ExpectVector(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ);
+    EXPECT_GT(m_kFirst->m_uiChangeStamp, stamp);
+}
+
+TEST_F(TwoMeshes, ASeamStaysOpenForOtherTimesAndForASideThatIsOff)
+{
+    AttachSeam();
+    CControl& control = *m_kSecond->GetControl();
+    control.m_fPhase = 1.0f;
+    Update(2.0f);
+    ExpectVector(m_kFirst->WorldXYZBuffer()[0], kVec3Zero);
+    control.m_fPhase = 0.0f;
+    control.m_bActive = false;
+    Update(5.0f);
+    ExpectVector(m_kFirst->WorldXYZBuffer()[0], kVec3Zero);
+    control.m_bActive = true;
+    Update(5.0f);
+    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0});
+}
+
+TEST_F(TwoMeshes, APointNamedTwiceMovesTwiceAndOneThatIsNotThereNever)
+{
+    AttachSeam();
+    m_kSeam->m_kFirst.m_kPoints = {0, 0, 99, 1};
+    m_kSeam->m_kSecond.m_kPoints = {0, 0, 1};
+    m_kSecond->m_kMatrix = Moved(4, 0, 0);
+    m_kSeam->m_kSecond.m_kPoints[1] = 1; // at 5
+    Update(1.0f);
+    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {3.5f, 0, 0});
+    ExpectVector(m_kSecond->WorldXYZBuffer()[0], {2, 0, 0});
+    ExpectVector(m_kSecond->WorldXYZBuffer()[1], {3.5f, 0, 0});
+}
+
+TEST_F(TwoMeshes, NormalsAreSmoothedWhereOtherMeshesAreNear)
+{
+    AttachSmoothing(1.25f);
+    // The first's normal 1 stands at (1, 0, 0), the second's 0 at (2, 0, 0); all others are farther apart.
+    Update(1.0f);
+    ExpectVector(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ);
+    ExpectVector(m_kFirst->WorldNormalBuffer()[1], {kDiagonal, 0, kDiagonal});
+    ExpectVector(m_kSecond->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal});
+    ExpectVector(m_kSecond->WorldNormalBuffer()[2], kVec3UnitX); // not selected
+
+    m_kSmoothing->m_fThreshold = 1.0f; // strictly below
+    Update(2.0f);
+    ExpectVector(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ);
+}
+
+TEST_F(TwoMeshes, ASelectedNormalThatNoCornerNamesBecomesZero)
+{
+    AttachSmoothing(0.1f);
+    m_kFirst->NormalTriIndexBuffer()[1] = 0;
+    Update(1.0f);
+    ExpectVector(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ);
+    EXPECT_EQ(m_kFirst->WorldNormalBuffer()[1], kVec3Zero);
+}
+
+// The rule told as it stands, over every pair, against what the cells find.
+TEST(Smoothing, CellsFindWhatIsNearAndNothingElse)
+{
+    std::mt19937 random(3);
+    std::uniform_real_distribution<float> place(-4.0f, 4.0f);
+    const Ref<CEditNormalData> smoothing = new CEditNormalData;
+    smoothing->m_fThreshold = 0.75f;
+    smoothing->m_kMeshes.resize(3);
+    std::vector<Ref<CTriMesh>> meshes;
+    for (CEditNormalData::Record& record : smoothing->m_kMeshes)
+    {
+        Ref<CTriMesh> mesh = PointMesh(std::vector<Vec3>(99));
+        for (Vec3& point : mesh->XYZBuffer())
+            point = {place(random), place(random), place(random) * 0.1f};
+        mesh->SetNormalCount(99);
+        mesh->SetTriangleQuantity(33);
+        for (uint32_t corner = 0; corner < 99; ++corner)
+            mesh->XYZTriIndexBuffer()[corner] = mesh->NormalTriIndexBuffer()[corner] = corner;
+        mesh->UpdateScene(0.0f, false);
+        record.m_pkMesh.Set(mesh.Get());
+        record.m_kNormals = CBitArray(99);
+        for (size_t normal = 0; normal < 99; ++normal)
+            record.m_kNormals.Set(normal);
+        meshes.push_back(mesh);
+    }
+    std::vector<Vec3> expected;
+    for (const auto& mesh : meshes)
+    {
+        for (size_t i = 0; i < 99; ++i)
+        {
+            Vec3 sum = mesh->WorldNormalBuffer()[i];
+            for (const auto& other : meshes)
+            {
+                for (size_t k = 0; k < 99 && !(other == mesh); ++k)
+                {
+                    if (Vec3Length(mesh->WorldXYZBuffer()[i] - other->WorldXYZBuffer()[k]) < 0.75)
+                        sum = sum + other->WorldNormalBuffer()[k];
+                }
+            }
+            expected.push_back(Vec3Normalized(sum));
+        }
+    }
+    EXPECT_TRUE(smoothing->Update(0.0f));
+    for (size_t i = 0; i < expected.size(); ++i)
+        ExpectVector(meshes[i / 99]->WorldNormalBuffer()[i % 99], expected[i]);
+    meshes[1]->m_bNormalsValid = false;
+    EXPECT_FALSE(smoothing->Update(0.0f)) << "one mesh is behind";
+}
+
+} // namespace gw
