@@ -1,7 +1,9 @@
 #include "SceneSamples.h"
 
 #include "CCamera.h"
+#include "CCameraControl.h"
 #include "CLight.h"
+#include "CLightControl.h"
 
 namespace gw {
 
@@ -29,6 +31,12 @@ void FillTrack(CKeyframeControl& track)
     track.m_uiParentMask = 0x155;
 }
 
+void FillKeys(CVectorKeyControl& control)
+{
+    control.m_kKeys = {kVec3UnitX, kVec3One};
+    control.m_kKeyTimes = {3.0f};
+}
+
 CCamera* MakeCamera()
 {
     CCamera* camera = new CCamera;
@@ -39,6 +47,9 @@ CCamera* MakeCamera()
     camera->m_bCameraFlagB = false;
     camera->SetCameraTarget(new CCameraTarget);
     camera->GetCameraTarget()->SetName("look here");
+    CCameraControl* control = new CCameraControl;
+    FillKeys(*control);
+    camera->AttachControl(control);
     return camera;
 }
 
@@ -49,6 +60,9 @@ CPointLight* MakeLight()
     light->m_fIntensity = 3.0f;
     light->m_bLightOn = false;
     light->m_kLocation = {9, 8, 7};
+    CLightControl* control = new CLightControl;
+    FillKeys(*control);
+    light->AttachControl(control);
     return light;
 }
 
