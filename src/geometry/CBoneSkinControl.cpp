@@ -19,6 +19,23 @@ void AddScaled(Mat4& sum, const Mat4& matrix, float weight)
         sum.m[i] += weight * matrix.m[i];
 }
 
+// A point that no bone moves goes with the mesh, and so does what its weights lack.
+Mat4 Blend(std::span<const CSkinPointRecord> influences, std::span<const Mat4> matrices, const Mat4& world)
+{
+    if (influences.empty())
+        return world;
+    Mat4 blend = kMat4Zero;
+    float sum = 0.0f;
+    for (const CSkinPointRecord& influence : influences)
+    {
+        sum += influence.weight;
+        AddScaled(blend, matrices[influence.bone], influence.weight);
+    }
+    if (!(sum >= 1.0f))
+        AddScaled(blend, world, 1.0f - sum);
+    return blend;
+}
+
 } // namespace
 
 CBoneSkinControl::CBoneSkinControl() = default;
@@ -136,6 +153,15 @@ std::vector<Mat4> CBoneSkinControl::SkinMatrices(const Mat4& before) const
     return matrices;
 }
 
+// Those of one point, from `next` on, which then stands behind them.
+std::span<const CSkinPointRecord> CBoneSkinControl::TakeInfluences(size_t& next, uint32_t point) const
+{
+    const size_t first = next;
+    while (next < m_kPoints.size() && m_kPoints[next].point == point)
+        ++next;
+    return std::span(m_kPoints).subspan(first, next - first);
+}
+
 bool CBoneSkinControl::Update(float)
 {
     CGeometry* target = RecordCast<CGeometry>(GetTarget());
@@ -147,25 +173,12 @@ bool CBoneSkinControl::Update(float)
     // Behind a control that has already put the points into the world they first go back to the model.
     const std::vector<Mat4> matrices =
         SkinMatrices(target->m_bWorldValid ? Mat4InverseOrIdentity(world) : kMat4Identity);
-    auto record = m_kPoints.begin();
     const std::span<Vec3> points = target->WorldXYZBuffer();
+    size_t next = 0;
     for (uint32_t point = 0; point < points.size(); ++point)
     {
-        if (record == m_kPoints.end() || record->point != point)
-        {
-            points[point] = TransformCoord(points[point], world);
-            continue;
-        }
-        Mat4 blend = kMat4Zero;
-        float sum = 0.0f;
-        for (; record != m_kPoints.end() && record->point == point; ++record)
-        {
-            sum += record->weight;
-            AddScaled(blend, matrices[record->bone], record->weight);
-        }
-        if (!(sum >= 1.0f))
-            AddScaled(blend, world, 1.0f - sum);
-        points[point] = TransformCoord(points[point], blend);
+        const auto influences = TakeInfluences(next, point);
+        points[point] = TransformCoord(points[point], Blend(influences, matrices, world));
     }
     target->m_bWorldValid = true;
     ++target->m_uiChangeStamp;

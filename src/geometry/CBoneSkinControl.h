@@ -25,6 +25,14 @@ struct CSkinBoneRecord
     std::vector<CSkinInfluence> m_kInfluences;
 };
 
+/// An influence that acts, as an update walks them: by point, for one point in the order of the bones.
+struct CSkinPointRecord
+{
+    uint32_t point;
+    uint32_t bone; ///< index of the bone
+    float weight;
+};
+
 /// Moves the points of its target, a geometry, with bones. Matrices are blended and each point is transformed
 /// once. What the weights of a point lack up to 1 goes to the mesh's own matrix.
 class CBoneSkinControl : public CControl
@@ -51,23 +59,16 @@ public:
 
     /// A new bone comes with this offset; a known one keeps its own. To be followed by RebuildSkinTables.
     void AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset);
-    /// Sorts the influences by point. To be run when bones, influences or the target have changed.
+    /// Sorts the influences by point. To be run when bones or influences have changed.
     void RebuildSkinTables();
 
     const std::vector<CSkinBoneRecord>& Bones() const { return m_kBones; }
 
 private:
-    // An influence that acts, as the update walks them: by point, for one point in the order of the bones.
-    struct CSkinPointRecord
-    {
-        uint32_t point;
-        uint32_t bone;
-        float weight;
-    };
-
     CSkinBoneRecord& RecordOf(CSpatial& bone, const Mat4& offset);
     uint32_t LiveBones() const;
     std::vector<Mat4> SkinMatrices(const Mat4& before) const;
+    std::span<const CSkinPointRecord> TakeInfluences(size_t& next, uint32_t point) const;
 
     std::vector<CSkinBoneRecord> m_kBones; // in the order of the file or of their adding
     // No entry for points that no bone moves: many skins on one large mesh must not take its size each.

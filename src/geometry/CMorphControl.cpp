@@ -3,6 +3,8 @@
 #include "CFieldArchive.h"
 #include "CGeometry.h"
 
+#include <algorithm>
+
 namespace gw {
 
 const CRTTI CMorphControl::ms_kRTTI{"CMorphControl", &CControl::ms_kRTTI};

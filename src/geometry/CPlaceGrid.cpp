@@ -36,25 +36,28 @@ CPlaceGrid::Cell CPlaceGrid::CellOf(const Vec3& point) const
             CellIndex(point.z, m_fDistance)};
 }
 
+Vec3 CPlaceGrid::SumRun(const NormalPlace& place, const Cell& first, const Cell& last) const
+{
+    Vec3 sum = kVec3Zero;
+    auto entry = std::ranges::lower_bound(m_kEntries, first, {}, &Entry::cell);
+    for (; entry != m_kEntries.end() && entry->cell <= last; ++entry)
+    {
+        const NormalPlace& other = *entry->place;
+        if (other.m_uiMesh != place.m_uiMesh && Vec3Length(place.m_kPoint - other.m_kPoint) < m_fDistance)
+            sum = sum + other.m_kNormal;
+    }
+    return sum;
+}
+
 Vec3 CPlaceGrid::SumNear(const NormalPlace& place) const
 {
     Vec3 sum = kVec3Zero;
     const Cell middle = CellOf(place.m_kPoint);
     for (int64_t x = middle.x - 1; x <= middle.x + 1; ++x)
     {
+        // Cells beside each other along z are one run.
         for (int64_t y = middle.y - 1; y <= middle.y + 1; ++y)
-        {
-            // Cells beside each other along z are one run.
-            const Cell last{x, y, middle.z + 1};
-            auto entry = std::ranges::lower_bound(m_kEntries, Cell{x, y, middle.z - 1}, {}, &Entry::cell);
-            for (; entry != m_kEntries.end() && entry->cell <= last; ++entry)
-            {
-                const NormalPlace& other = *entry->place;
-                if (other.m_uiMesh != place.m_uiMesh &&
-                    Vec3Length(place.m_kPoint - other.m_kPoint) < m_fDistance)
-                    sum = sum + other.m_kNormal;
-            }
-        }
+            sum = sum + SumRun(place, {x, y, middle.z - 1}, {x, y, middle.z + 1});
     }
     return sum;
 }

@@ -45,6 +45,8 @@ private:
     };
 
     Cell CellOf(const Vec3& point) const;
+    // Of the cells from one to another, in their order.
+    Vec3 SumRun(const NormalPlace& place, const Cell& first, const Cell& last) const;
 
     double m_fDistance;
     std::vector<Entry> m_kEntries; // by cell, within a cell in the order of the places

@@ -3,6 +3,8 @@
 #include "CFieldArchive.h"
 #include "CTriMeshUVWMap.h"
 
+#include <algorithm>
+
 namespace gw {
 
 const CRTTI CTriMeshUVWMapControl::ms_kRTTI{"CTriMeshUVWMapControl", &CControl::ms_kRTTI};
