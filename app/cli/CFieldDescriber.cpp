@@ -118,7 +118,7 @@ bool CFieldDescriber::Presence(const char* name, bool present)
     TakeCount({});
     if (present)
     {
-        m_kCount = {name, 1, 0};
+        m_kCount = {name, 1};
     }
     else if (IsTold(EDescribe::Fields))
     {
@@ -128,10 +128,10 @@ bool CFieldDescriber::Presence(const char* name, bool present)
     return present;
 }
 
-size_t CFieldDescriber::Count(const char* name, size_t count, size_t leastBytes)
+size_t CFieldDescriber::Count(const char* name, size_t count, size_t)
 {
     TakeCount({});
-    m_kCount = {name, count, leastBytes};
+    m_kCount = {name, count};
     return count;
 }
 
@@ -165,15 +165,11 @@ void CFieldDescriber::Slot(const char* name, const CLinkSlot& slot)
         m_kJson.Integer(static_cast<int64_t>(number->second));
 }
 
-// A list of records has a count before it, of records that are larger than a link. What has no count, or one
-// of link size, is a row of links.
-void CFieldDescriber::BeginArray(const char* name, size_t)
+void CFieldDescriber::BeginArray(const char* name, EListKind kind)
 {
-    constexpr size_t kLinkBytes = 4;
-    const PendingCount count = TakeCount(name);
-    const bool isLinks = count.name.empty() || count.leastBytes == kLinkBytes;
+    TakeCount(name);
     if (m_kNest.empty())
-        m_bArrayIsTold = m_eWhat == (isLinks ? EDescribe::Links : EDescribe::Fields);
+        m_bArrayIsTold = m_eWhat == (kind == EListKind::Links ? EDescribe::Links : EDescribe::Fields);
     if (m_bArrayIsTold)
     {
         Key(name);

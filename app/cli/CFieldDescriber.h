@@ -44,7 +44,7 @@ public:
 protected:
     void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
     void Slot(const char* name, const CLinkSlot& slot) override;
-    void BeginArray(const char* name, size_t count) override;
+    void BeginArray(const char* name, EListKind kind) override;
     void EndArray() override;
     void BeginElement() override;
     void EndElement() override;
@@ -56,7 +56,6 @@ private:
     {
         std::string_view name; ///< empty for none
         size_t count = 0;
-        size_t leastBytes = 0;
     };
 
     bool IsTold(EDescribe what) const { return m_kNest.empty() ? what == m_eWhat : m_bArrayIsTold; }

@@ -37,6 +37,13 @@ constexpr size_t FieldBytes(EFieldKind kind)
     return kBytes[static_cast<size_t>(kind)];
 }
 
+/// What a list is made of.
+enum class EListKind : uint8_t
+{
+    Links,
+    Records, ///< elements with fields of their own
+};
+
 /// The kind of a plain C++ type.
 template <class T>
 constexpr EFieldKind FieldKind()
@@ -150,7 +157,7 @@ public:
     template <class Slots>
     void LinkRow(const char* name, Slots& slots)
     {
-        BeginArray(name, slots.size());
+        BeginArray(name, EListKind::Links);
         for (auto& slot : slots)
         {
             if constexpr (requires { slot.Set(nullptr); })
@@ -212,7 +219,7 @@ protected:
 
     virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
     virtual void Slot(const char* name, const CLinkSlot& slot) = 0;
-    virtual void BeginArray(const char*, size_t) {}
+    virtual void BeginArray(const char*, EListKind) {}
     virtual void EndArray() {}
     virtual void BeginElement() {}
     virtual void EndElement() {}
@@ -248,7 +255,7 @@ void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
     CFieldCounter counter;
     fields(counter, least);
     elements.resize(Count(name, elements.size(), static_cast<size_t>(counter.ByteCount())));
-    BeginArray(name, elements.size());
+    BeginArray(name, EListKind::Records);
     for (T& element : elements)
     {
         BeginElement();

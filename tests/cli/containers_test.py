@@ -72,6 +72,13 @@ class Containers(CliTest):
         self.assertEqual(hips["fields"]["m_kMatrix"], moved(0, 90, 0))
         self.assertEqual((told["frames"], told["rate"], told["seconds"]), (3, 2, 1))
 
+    def test_lists_of_lists_are_fields_and_no_links(self):
+        groups = struct.pack("<8I", 0, 0, 0, 0, 2, 1, 7, 0) + struct.pack("<I", 0)
+        self.write("seam.orn", Container().record("CConnectData", 1, "", (0, 0, 0), groups, True).bytes)
+        seam = json.loads(self.run_program("info", "seam.orn", "--json").out)["objects"][0]
+        self.assertEqual(seam["fields"]["first groups"], [{"normals": [7]}, {"normals": []}])
+        self.assertNotIn("first groups", seam["links"])
+
     def test_a_list_of_one_stays_a_list(self):
         self.write("scene.orn", one_bone_scene(frames=1))
         track = json.loads(self.run_program("info", "scene.orn", "--json").out)["objects"][1]
