@@ -72,6 +72,8 @@ constexpr Words<EFailure> kFailures[] = {
         "map both feet and the left thigh in the profile"),
     Row(UnknownChannel, "unknown-channel", "a channel has a name that is not known; it was passed over"),
     Row(CutName, "cut-name", "a name cannot be used as it stands and was changed"),
+    Row(OpenHeader, "open-header", "no empty line closes the header, so the motion has no frames",
+        "put an empty line behind the header"),
 };
 
 constexpr Words<EMisfit> kMisfits[] = {

@@ -46,6 +46,7 @@ enum class EFailure : uint8_t
     BadScale,       ///< the body measures give no usable scale; 1.0 was taken
     UnknownChannel, ///< a channel name that is not one of the nine
     CutName,        ///< a name that was not usable as it stands
+    OpenHeader,     ///< a header that nothing closes, so that the motion behind it has no frame
 };
 
 /// One thing that failed or that a user should know.

@@ -2,9 +2,12 @@
 
 #include "CKeyframeControl.h"
 #include "CLineWriter.h"
+#include "ERROBJ.h"
 #include "Paths.h"
 #include "RestPose.h"
 #include "TKBVHStream.h"
+#include "TKCHAStream.h"
+#include "TKCHBStream.h"
 #include "TKHTRStream.h"
 
 #include <algorithm>
@@ -34,6 +37,8 @@ std::unique_ptr<CMotionFile> Make()
 constexpr StreamRow kStreams[] = {
     {".htr", Make<TKHTRStream>, true },
     {".bvh", Make<TKBVHStream>, false},
+    {".cha", Make<TKCHAStream>, false},
+    {".chb", Make<TKCHBStream>, false},
 };
 
 const StreamRow* FindStream(const std::string& path)
@@ -43,13 +48,17 @@ const StreamRow* FindStream(const std::string& path)
     return found == std::end(kStreams) ? nullptr : found;
 }
 
-// Sizes are bounded by those of the file or of the trees; a machine may still have less memory.
+// The answer of a stream's operation, whatever it throws: its one exception comes with a reason in the
+// record. Sizes are bounded by those of the file or of the trees; a machine may still have less memory.
 template <class F>
-bool WithinMemory(CFailureRecord& record, F operation)
+bool AnswerOf(CFailureRecord& record, F operation)
 {
     try
     {
         return operation();
+    } catch (const ERROBJ&)
+    {
+        return false;
     } catch (const std::bad_alloc&)
     {
         return record.Fail(EFailure::OutOfMemory);
@@ -81,7 +90,7 @@ bool CMotionFile::Load(const std::string& path)
     if (const StreamRow* row = FindStream(path))
     {
         const auto stream = row->make();
-        const bool loaded = WithinMemory(stream->m_kRecord, [&] { return stream->Load(path); });
+        const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
         m_kRecord = stream->m_kRecord;
         if (!loaded)
             return false;
@@ -103,7 +112,7 @@ bool CMotionFile::Save(const std::string& path, float frameScale)
     if (!HasExtension(path, ".htr"))
         return m_kRecord.Fail(path.empty() ? EFailure::NotFound : EFailure::UnknownFormat);
     TKHTRStream stream(*this);
-    const bool saved = WithinMemory(stream.m_kRecord, [&] { return stream.Save(path, frameScale); });
+    const bool saved = AnswerOf(stream.m_kRecord, [&] { return stream.Save(path, frameScale); });
     m_kRecord = stream.m_kRecord;
     return saved;
 }

@@ -2,7 +2,7 @@
 import json
 
 from harness import DONE, FAILED, CliTest, main
-from made import BVH, bvh, htr, profile
+from made import BVH, CHA, bvh, cha, chb, htr, profile
 
 ROW = "1 90 0 0 0 0 90 0 0"
 DOUBLED = bvh("CHANNELS 3 Z", "CHANNELS 6 Xposition Yposition Zposition Z")
@@ -49,6 +49,26 @@ BROKEN_HTR = [
     ("an infinity in the rest pose", htr("Hips 0 90 0", "Hips 0 inf 0"), 20, '"inf"'),
 ]
 
+BROKEN_CHA = [
+    ("an empty file", "", 0, "[HIERARCHY]"),
+    ("an empty line too many", cha("\n\n", "\n\n\n"), 8, "empty line"),
+    ("more segments than there can be", cha("Segments 2", "Segments 101"), 6, "limit"),
+    ("no bone hangs on anything", cha("Hips Global", "Hips Chest"), 14, "Global"),
+    ("more frames than any file has", cha("EndFrame 3", "EndFrame 2000000000"), 14, "fewer rows"),
+    ("a file that is cut", CHA[:-60], 25, "fewer rows"),
+    ("no number in a row", cha("1, 2, 90", "1, nan, 90"), 22, '"nan"'),
+]
+
+CHB_END = len(chb())
+BROKEN_CHB = [  # what, content, byte or 0, words
+    ("an empty file", b"", 0, "middle of a record"),
+    ("another file", BVH, 0, "[HEADER]"),
+    ("a version to come", chb(version=722), 25, "version"),
+    ("a file that is cut", chb()[:-1], CHB_END - 4, "middle of a record"),
+    ("an infinity", chb()[:-4] + b"\0\0\x80\x7f", CHB_END, "number"),
+]
+
+
 WARNED = [  # what, content, code of the warning, line
     ("a short row", bvh(ROW, "1 90 0 0 0 0 90"), "short-row", 20),
     ("a number with something stuck to it", bvh(ROW, "1 90 0.0-7.5 0 0 0 90 0 0"), "stuck-number", 20),
@@ -73,7 +93,7 @@ class Files(CliTest):
         self.write("small.prf", profile("Small", [("Hips", "LowerTorso")]))
         self.write("out.htr", "old")
 
-    def assert_refused(self, name, rows):
+    def assert_refused(self, name, rows, place="%s:%d: "):
         commands = [["convert", name, "-o", "out.htr", "--force", "--profile", "small.prf"],
                     ["transcode", name, "out.bvh"], ["info", name], ["pose", name, "--frame", 1]]
         for what, content, line, word in rows:
@@ -82,7 +102,7 @@ class Files(CliTest):
                 with self.subTest(what, command=command[0]):
                     result = self.with_assets(*command)
                     self.assertEqual((result.code, result.out), (FAILED, ""), result.err)
-                    self.assert_words(result, ["%s:%d: " % (name, line) if line else name + ":", word])
+                    self.assert_words(result, [place % (name, line) if line else name + ":", word])
                     self.assertEqual(self.files(), sorted(["out.htr", "small.prf", name]))
                     self.assertEqual(self.read("out.htr"), b"old")
 
@@ -91,6 +111,12 @@ class Files(CliTest):
 
     def test_so_is_a_broken_htr(self):
         self.assert_refused("take.htr", BROKEN_HTR)
+
+    def test_so_is_a_broken_cha(self):
+        self.assert_refused("take.cha", BROKEN_CHA)
+
+    def test_so_is_a_broken_chb(self):
+        self.assert_refused("take.chb", BROKEN_CHB, place="%s: byte %d: ")
 
     def test_what_an_author_did_not_mean_is_told(self):
         for what, content, code, line in WARNED:
@@ -160,6 +186,35 @@ class Poses(CliTest):
             self.assertAlmostEqual(value, expected, places=5)
         self.assertEqual(chest["local"][12:], [0, 10, 0, 1])
         self.assertEqual(hips["parent"], None)
+
+    def test_motions_of_matrices_go_the_ways_of_a_bvh(self):
+        self.write("take.bvh", BVH)
+        expected = [self.poses("take.bvh", frame) for frame in range(3)]
+        self.write("small.prf", profile("Small", [("Hips", "LowerTorso")]))
+        for name, content, rate in (("take.cha", CHA, 30), ("take.chb", chb(), 1 / 0.06)):
+            with self.subTest(name):
+                self.write(name, content)
+                for frame in range(3):
+                    self.assert_same(self.poses(name, frame), expected[frame])
+                facts = json.loads(self.succeed("info", name, "--json").out)
+                self.assertEqual((facts["format"], facts["frames"]), (name[-3:], 4))
+                self.assertAlmostEqual(facts["rate"], rate, places=3)
+                self.succeed("transcode", name, name + ".bvh")
+                self.assert_same(self.poses(name + ".bvh", 1), expected[1])
+                self.succeed("convert", name, "-o", name + ".htr", "--profile", "small.prf")
+                self.assertGreater(json.loads(self.succeed("info", name + ".htr", "--json").out)["frames"], 1)
+                self.succeed("render", name, "-o", name + ".png", "--size", "32x32")
+                self.assertEqual(self.read(name + ".png")[:4], b"\x89PNG")
+
+    def poses(self, name, frame):
+        nodes = json.loads(self.succeed("pose", name, "--frame", frame).out)["nodes"]
+        return [(node["name"], node["parent"], node["world"]) for node in nodes]
+
+    def assert_same(self, found, expected):
+        for (*names, world), (*others, wanted) in zip(found, expected, strict=True):
+            self.assertEqual(names, others)
+            for a, b in zip(world, wanted, strict=True):
+                self.assertAlmostEqual(a, b, places=4)
 
     def test_a_motion_survives_being_written_as_bvh(self):
         self.write("take.bvh", BVH)

@@ -70,6 +70,50 @@ def htr(old, new):
     return HTR.replace(old, new, 1)
 
 
+# The same two joints, turned and moved as in BVH, one frame more: the end of a CHA is one before its last.
+CHA = """[HEADER]
+VersionNumber 100
+DataFrameRate 30
+BeginFrame 0
+EndFrame 3
+NumSegments 2
+
+[LENGTH]
+Hips 10
+Chest 5
+[HIERARCHY]
+Hips Global
+Chest Hips
+[MOTION]
+"""
+MATRICES = [(0, 90, 0, (1, 0, 0, 0, 1, 0, 0, 0, 1)), (1, 90, 0, (0, 1, 0, -1, 0, 0, 0, 0, 1)),
+            (2, 90, 0, (0, 0, -1, 0, 1, 0, 1, 0, 0)), (3, 90, 0, (1, 0, 0, 0, 1, 0, 0, 0, 1))]
+for number, (x, y, z, chest) in enumerate(MATRICES):
+    CHA += "Frame %d\nHips 1, 0, 0, 0, 1, 0, 0, 0, 1, %d, %d, %d\n" % (number, x, y, z)
+    CHA += "Chest %s, 0, 10, 0\n" % ", ".join(map(str, chest))
+
+
+def cha(old, new):
+    assert CHA.count(old) >= 1, old
+    return CHA.replace(old, new, 1)
+
+
+def chb(version=721, frames=MATRICES):
+    """The same in binary."""
+    def name(text):
+        return text.encode().ljust(256, b"\0")
+
+    header = [("VersionNumber", version), ("DataFrameRate", 30), ("BeginFrame", 0), ("EndFrame", len(frames) - 1),
+              ("NumSegments", 2)]
+    made = b"[HEADER]" + b"".join(key.encode() + struct.pack("<i", value) for key, value in header)
+    made += b"[LENGTH]" + name("Hips") + struct.pack("<f", 10) + name("Chest") + struct.pack("<f", 5)
+    made += b"[HIERARCHY]" + name("Hips") + name("Global") + name("Chest") + name("Hips") + b"[MOTION]"
+    for number, (x, y, z, chest) in enumerate(frames):
+        made += b"Frame" + struct.pack("<i12f", number, 1, 0, 0, 0, 1, 0, 0, 0, 1, x, y, z)
+        made += struct.pack("<12f", *chest, 0, 10, 0)
+    return made
+
+
 def profile(name, rows, rate=30):
     lines = [name, "FrameRate %d" % rate, "Position 0 0 0"]
     lines += ["%s <---> %s 0,0,0,1,2,3" % row for row in rows]

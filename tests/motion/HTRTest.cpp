@@ -34,11 +34,6 @@ std::string Changed(const Change& change)
     return change.from.empty() ? change.to : text.replace(at, change.from.size(), change.to);
 }
 
-const CKeyframeControl& TrackOf(const CMotionFile& motion, const char* name)
-{
-    return static_cast<const CKeyframeControl&>(*FindNode(motion.motionRoot.Get(), name)->GetControl());
-}
-
 std::string Chain(size_t depth)
 {
     std::string text = "[Header]\nNumSegments 100000\n[SegmentNames&Hierarchy]\nS0 GLOBAL\n";

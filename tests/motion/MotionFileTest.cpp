@@ -26,6 +26,9 @@ TEST(CMotionFile, ChoosesByTheExtension)
         {"a.bvh.htr", kSmallHTR, "Torso(Head)"},
         {".htr",      kSmallHTR, "Torso(Head)"},
         {"a.htr.bvh", kSmallHTR, ""           },
+        {"a.cha",     kSmallCHA, "Torso(Head)"},
+        {"a.CHA",     kSmallCHA, "Torso(Head)"},
+        {"a.chb",     kSmallCHA, ""           },
         {"a.txt",     kSmallBVH, ""           },
         {"bvh",       kSmallBVH, ""           },
     };

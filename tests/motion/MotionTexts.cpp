@@ -1,5 +1,6 @@
 #include "MotionTexts.h"
 
+#include "CKeyframeControl.h"
 #include "CMotionSampler.h"
 #include "Skeleton.h"
 
@@ -39,6 +40,10 @@ const struct
     {EFailure::RestPose,       "RestPose"      },
     {EFailure::UnknownChannel, "UnknownChannel"},
     {EFailure::CutName,        "CutName"       },
+    {EFailure::OpenHeader,     "OpenHeader"    },
+    {EFailure::BadHeader,      "BadHeader"     },
+    {EFailure::BadVersion,     "BadVersion"    },
+    {EFailure::Truncated,      "Truncated"     },
 };
 
 std::string FailureText(const CFailure& failure)
@@ -97,6 +102,11 @@ bool IsFinite(CNode& root)
     return std::ranges::all_of(NodesOf(root), [](const CNode* node) {
         return IsFinite(node->m_kMatrix) && IsFinite(node->m_kWorldMatrix);
     });
+}
+
+const CKeyframeControl& TrackOf(const CMotionFile& motion, const char* name)
+{
+    return static_cast<const CKeyframeControl&>(*FindNode(motion.motionRoot.Get(), name)->GetControl());
 }
 
 std::string WithCarriageReturns(std::string_view text)

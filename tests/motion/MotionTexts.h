@@ -8,6 +8,8 @@
 
 namespace gw {
 
+class CKeyframeControl;
+
 /// A motion that was loaded from a text through a file of its own.
 struct CLoadedMotion
 {
@@ -25,6 +27,8 @@ std::string TreeText(CNode* root);
 std::string RecordText(const CFailureRecord& record);
 /// Brings a motion to a frame; the node must exist.
 const CNode& PosedNode(CMotionFile& motion, const char* name, int frame);
+/// The track of a node that must exist.
+const CKeyframeControl& TrackOf(const CMotionFile& motion, const char* name);
 /// Whether all matrices of a tree hold finite numbers.
 bool IsFinite(CNode& root);
 
@@ -86,6 +90,32 @@ Head 0 50 0 10 20 30 20
 #Fr	Tx	Ty	Tz	Rx	Ry	Rz	SF
 1 0 0 0 0 0 0 1
 2 0 0 0 -5 15 25 1
+)";
+
+/// Two segments of three frames. The first is turned by 0, 90 and 180 degrees about Z.
+inline constexpr std::string_view kSmallCHA = R"([HEADER]
+VersionNumber 100
+DataFrameRate 25
+BeginFrame 0
+EndFrame 2
+NumSegments 2
+
+[LENGTH]
+Torso 50
+Head 20.5
+[HIERARCHY]
+Torso Global
+Head Torso
+[MOTION]
+Frame 0
+Torso 1, 0, 0, 0, 1, 0, 0, 0, 1, 1, 2, 3
+Head 1, 0, 0, 0, 1, 0, 0, 0, 1, 0, 50, 0
+Frame 1
+Torso 0, 1, 0, -1, 0, 0, 0, 0, 1, 4, 5, 6
+Head 0, 0, -1, 0, 1, 0, 1, 0, 0, 0, 51, 0
+Frame 2
+Torso -1, 0, 0, 0, -1, 0, 0, 0, 1, 7, 8, 9
+Head 1, 0, 0, 0, 0, 1, 0, -1, 0, 0, 52, 0
 )";
 
 } // namespace gw

@@ -43,6 +43,21 @@ void ExpectNear(const Mat4& found, const Mat4& expected, double tolerance)
         EXPECT_NEAR(found.m[i], expected.m[i], tolerance) << i;
 }
 
+// The poses of a motion at a frame, against those of a text.
+void ExpectPoses(CMotionFile& motion, int frame, const std::string& text, double tolerance)
+{
+    size_t at = 0;
+    for (size_t i = NodesOf(*motion.motionRoot).size(); i > 0; --i)
+    {
+        const std::string name = NameBehind(text, at);
+        const CNode& node = PosedNode(motion, name.c_str(), frame);
+        SCOPED_TRACE(name);
+        ExpectNear(node.m_kMatrix, MatrixBehind(text, "local", at), tolerance);
+        ExpectNear(node.m_kWorldMatrix, MatrixBehind(text, "world", at), tolerance);
+    }
+    EXPECT_EQ(text.find("\"name\"", at), text.npos) << "all nodes are there";
+}
+
 void ExpectSamePoses(CMotionFile& found, CMotionFile& expected)
 {
     ASSERT_EQ(TreeText(found.motionRoot.Get()), TreeText(expected.motionRoot.Get()));
@@ -106,15 +121,48 @@ TEST(RealMotions, StandAsAnIndependentReadingHasThem)
             return;
         CMotionFile motion;
         ASSERT_TRUE(motion.Load(folder + "source.bvh"));
-        const std::string text = ReadBytes(folder + "pose.json");
-        size_t at = 0;
-        for (size_t i = NodesOf(*motion.motionRoot).size(); i > 0; --i)
+        ExpectPoses(motion, row.frame, ReadBytes(folder + "pose.json"), 1e-3);
+    }
+}
+
+TEST(RealMotions, OfMatricesStandAsAnIndependentReadingHasThem)
+{
+    const struct
+    {
+        const char* name;
+        const char* extension;
+        int frame;
+    } rows[] = {
+        {"plain-text",   ".cha", 20},
+        {"remarks",      ".cha", 18},
+        {"short-row",    ".cha", 16},
+        {"open-header",  ".cha", 5 },
+        {"plain-binary", ".chb", 13},
+        {"begin",        ".chb", 6 },
+        {"roots",        ".chb", 13},
+        {"hundred",      ".chb", 4 },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.name);
+        const std::string path = SharedDataFolder() + "motions/" + row.name;
+        if (!FileExists(path + row.extension))
+            return;
+        CMotionFile motion;
+        ASSERT_TRUE(motion.Load(path + row.extension));
+        ExpectPoses(motion, row.frame, ReadBytes(path + ".pose.json"), 1e-4);
+    }
+}
+
+TEST(RealMotions, OfMatricesAreRefusedWhereTheyAreDamaged)
+{
+    const std::string folder = SharedDataFolder() + "motions/";
+    for (const char* extension : {".cha", ".chb"})
+    {
+        for (const std::string& name : FilesInFolder(folder, extension))
         {
-            const std::string name = NameBehind(text, at);
-            const CNode& node = PosedNode(motion, name.c_str(), row.frame);
-            SCOPED_TRACE(name);
-            ExpectNear(node.m_kMatrix, MatrixBehind(text, "local", at), 1e-3);
-            ExpectNear(node.m_kWorldMatrix, MatrixBehind(text, "world", at), 1e-3);
+            CMotionFile motion;
+            EXPECT_EQ(motion.Load(folder + name), !name.starts_with("bad-")) << name;
         }
     }
 }

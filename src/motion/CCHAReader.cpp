@@ -1,0 +1,321 @@
+#include "CCHAReader.h"
+
+#include "CTextLines.h"
+#include "MotionNode.h"
+#include "Numbers.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+constexpr signed char kFirstOfNames = '?'; // in sections, lines that begin with less are remarks
+constexpr size_t kBytesPerRow = 4;         // a name, a blank, a digit and a line feed
+
+struct KeyRow
+{
+    std::string_view name;
+    int TKCHFile::*field;
+};
+
+constexpr KeyRow kKeys[] = {
+    {"VersionNumber", &TKCHFile::versionNumber},
+    {"DataFrameRate", &TKCHFile::dataFrameRate},
+    {"BeginFrame",    &TKCHFile::beginFrame   },
+    {"EndFrame",      &TKCHFile::endFrame     },
+    {"NumSegments",   &TKCHFile::numSegments  },
+};
+
+// The character is signed: names that begin with a letter of another alphabet are remarks too.
+bool IsRemark(std::string_view line)
+{
+    return line.empty() || static_cast<signed char>(line[0]) < kFirstOfNames;
+}
+
+std::string_view SkipBlanks(std::string_view text)
+{
+    const auto isBlank = [](char c) { return c == ' ' || (c >= '\t' && c <= '\r'); };
+    return {std::ranges::find_if_not(text, isBlank), text.end()};
+}
+
+} // namespace
+
+const CCHAReader::HandlerRow CCHAReader::kHandlers[] = {
+    {"[HEADER]",    &CCHAReader::OpenHeader   },
+    {"[LENGTH]",    &CCHAReader::ReadLengths  },
+    {"[HIERARCHY]", &CCHAReader::ReadHierarchy},
+    {"[MOTION]",    &CCHAReader::ReadMotion   },
+};
+
+bool CCHAReader::Fail(EFailure reason, std::string_view name)
+{
+    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
+}
+
+void CCHAReader::Warn(EFailure reason, std::string_view name)
+{
+    m_kRecord.Warn(reason, m_kLines.LineNumber(), Quote(name));
+}
+
+bool CCHAReader::Read()
+{
+    for (std::string_view rest; m_kLines.Next(rest);)
+    {
+        const std::string_view word = NextToken(rest);
+        if (word.empty() && m_uiOpenHeaders == 0)
+            return CheckFile(EFailure::BlankLine);
+        if (word.empty())
+            CloseHeader();
+        else if (!ReadWord(word, rest))
+            return false;
+    }
+    // The end of the file closes a header too, but only after the motion has been read without a frame.
+    if (m_uiOpenHeaders > 0)
+        CloseHeader();
+    return CheckFile(EFailure::MissingSection);
+}
+
+bool CCHAReader::ReadWord(std::string_view word, std::string_view rest)
+{
+    const auto section = std::ranges::find(kHandlers, word, &HandlerRow::section);
+    if (section != std::end(kHandlers))
+        return (this->*section->read)();
+    const auto key = std::ranges::find(kKeys, word, &KeyRow::name);
+    return key == std::end(kKeys) || ReadKey(word, m_kFile.*key->field, rest);
+}
+
+bool CCHAReader::ReadKey(std::string_view key, int& field, std::string_view rest)
+{
+    const std::string_view token = NextToken(rest);
+    if (token.empty())
+        return Fail(EFailure::MissingTokens, key);
+    if (!ScanInt(token, field))
+        return Fail(EFailure::BadNumber, token);
+    if (m_kFile.numSegments > kSegmentLimit)
+        return Fail(EFailure::TooLarge, key);
+    return m_kFile.beginFrame >= 0 || Fail(EFailure::BadNumber, token);
+}
+
+bool CCHAReader::OpenHeader()
+{
+    ++m_uiOpenHeaders;
+    return true;
+}
+
+void CCHAReader::CloseHeader()
+{
+    --m_uiOpenHeaders;
+    m_kFile.CountFrames();
+}
+
+// The next line that is no remark. False, with the cursor before it, where a section begins.
+bool CCHAReader::NextSectionLine(std::string_view& line)
+{
+    while (m_kLines.Next(line))
+    {
+        if (line.starts_with('['))
+        {
+            m_kLines.StepBack();
+            return false;
+        }
+        if (!IsRemark(line))
+            return true;
+    }
+    return false;
+}
+
+bool CCHAReader::ReadLengths()
+{
+    for (std::string_view line; NextSectionLine(line);)
+    {
+        if (!ReadLength(line))
+            return false;
+    }
+    return true;
+}
+
+bool CCHAReader::ReadLength(std::string_view line)
+{
+    const std::string_view name = NextWord(line);
+    const std::string_view number = NextWord(line);
+    if (number.empty())
+    {
+        Warn(EFailure::MissingTokens, name);
+        return true;
+    }
+    float length = 0.0f;
+    ENumber kind;
+    if (!ScanFloat(number, length, kind) || kind == ENumber::Unusual)
+        return Fail(EFailure::BadNumber, number);
+    m_kFile.lengths.emplace_back(name, length);
+    return true;
+}
+
+bool CCHAReader::ReadHierarchy()
+{
+    m_kFile.MakeRoot();
+    bool allCount = true;
+    for (std::string_view line; NextSectionLine(line);)
+    {
+        if (!AddSegment(line, allCount))
+            return false;
+    }
+    if (!allCount)
+        Warn(EFailure::BadCount, "NumSegments");
+    m_kFile.LinkSegments(m_kRecord, m_kLines.LineNumber());
+    return true;
+}
+
+// Lines behind those that the header counts hang nowhere, so they need not be kept.
+bool CCHAReader::AddSegment(std::string_view line, bool& counts)
+{
+    const std::string_view name = NextWord(line);
+    const std::string_view parentName = NextWord(line);
+    if (name.size() > kNameLimit || parentName.size() > kNameLimit)
+        return Fail(EFailure::BadName, name);
+    counts = std::ssize(m_kFile.segments) < m_kFile.numSegments;
+    if (counts)
+        m_kFile.AddSegment(name, parentName);
+    return true;
+}
+
+bool CCHAReader::ReadMotion()
+{
+    m_bHasMotion = true;
+    if (!m_kFile.FirstRoot())
+        return CheckFile(EFailure::MissingSection);
+    if (m_uiOpenHeaders > 0 && m_kFile.frameCount == 0)
+        Warn(EFailure::OpenHeader, "[HEADER]");
+    if (!ReservePlaces())
+        return Fail(EFailure::TooFewRows, "EndFrame");
+    size_t index = 0;
+    for (std::string_view line; m_kLines.Next(line);)
+    {
+        if (IsRemark(line))
+            continue;
+        if (line.starts_with('F'))
+            index = 0;
+        else if (!ReadRow(index++, line))
+            return false;
+        m_kLines.ForgetRead();
+    }
+    return TakeFrames();
+}
+
+std::span<CCHAReader::Place> CCHAReader::CountedPlaces()
+{
+    return std::span(m_kPlaces).first(static_cast<size_t>(std::max(m_kFile.numSegments, 0)));
+}
+
+// Makes room for the frames. False where the bytes that remain cannot hold as many rows.
+bool CCHAReader::ReservePlaces()
+{
+    const auto frames = static_cast<size_t>(m_kFile.frameCount);
+    if (frames == 0)
+        return true;
+    const size_t needed = static_cast<size_t>(m_kFile.beginFrame) + frames;
+    if (needed > (m_kLines.BytesLeft() + 1) / kBytesPerRow / std::max<size_t>(CountedPlaces().size(), 1))
+        return false;
+    for (Place& place : CountedPlaces())
+    {
+        place.segment.matrices.reserve(frames);
+        place.segment.positions.reserve(frames);
+    }
+    return true;
+}
+
+bool CCHAReader::ReadRow(size_t index, std::string_view line)
+{
+    const std::string_view name = NextWord(line);
+    if (index >= m_kPlaces.size())
+        return Fail(EFailure::TooLarge, name);
+    if (name.size() > kNameLimit)
+        return Fail(EFailure::BadName, name);
+    Place& place = m_kPlaces[index];
+    size_t count = 0;
+    if (!ReadNumbers(line, place.row, count))
+        return false;
+    const bool counts = index < CountedPlaces().size();
+    if (counts && count == 0)
+        return Fail(EFailure::MissingTokens, name);
+    if (counts && count < place.row.size())
+        Warn(EFailure::ShortRow, name);
+    place.segment.name = name;
+    const auto begin = static_cast<size_t>(m_kFile.beginFrame);
+    const size_t row = place.rowCount++;
+    if (!counts || row < begin || row - begin >= static_cast<size_t>(m_kFile.frameCount))
+        return true;
+    place.segment.matrices.emplace_back();
+    std::copy_n(place.row.data(), 9, place.segment.matrices.back().m);
+    place.segment.positions.push_back({place.row[9], place.row[10], place.row[11]});
+    return true;
+}
+
+// As sscanf takes numbers with a comma behind each: blanks may stand before a number, not before the comma.
+// Where one is missing the others stay as they were.
+bool CCHAReader::ReadNumbers(std::string_view text, Row& row, size_t& count)
+{
+    for (count = 0; count < row.size(); ++count)
+    {
+        if (count > 0 && !text.starts_with(','))
+            return true;
+        text = SkipBlanks(text.substr(count > 0 ? 1 : 0));
+        if (text.empty() || text.starts_with(','))
+            return true;
+        const char* next;
+        ENumber kind;
+        const float value = ReadFloat(text.data(), text.data() + text.size(), next, kind);
+        if (kind == ENumber::None || kind == ENumber::Unusual)
+            return Fail(EFailure::BadNumber, NextToken(text));
+        row[count] = value;
+        text.remove_prefix(static_cast<size_t>(next - text.data()));
+    }
+    return true;
+}
+
+// Hands the frames over to the records that the rows name: of equal names the first row's.
+bool CCHAReader::TakeFrames()
+{
+    for (Place& place : CountedPlaces())
+    {
+        const auto frames = static_cast<size_t>(m_kFile.frameCount);
+        if (frames > 0 && place.rowCount < static_cast<size_t>(m_kFile.beginFrame) + frames)
+            return Fail(EFailure::TooFewRows, place.segment.name);
+        TakeFrames(place);
+    }
+    for (const auto& segment : m_kFile.segments)
+    {
+        if (m_kFile.frameCount > 0 && segment->matrices.empty() && m_kFile.FindSegment(segment->name))
+            Warn(EFailure::TooFewRows, segment->name);
+    }
+    return true;
+}
+
+void CCHAReader::TakeFrames(Place& place)
+{
+    TKCHSegment* const segment = m_kFile.FindSegment(place.segment.name);
+    if (segment && segment->matrices.empty())
+    {
+        segment->matrices = std::move(place.segment.matrices);
+        segment->positions = std::move(place.segment.positions);
+    }
+    else if (place.rowCount > 0 && !segment)
+        Warn(EFailure::UnknownSegment, place.segment.name);
+}
+
+bool CCHAReader::CheckFile(EFailure end)
+{
+    if (!m_kFile.root)
+        return Fail(end, "[HIERARCHY]");
+    if (!m_kFile.FirstRoot())
+        return Fail(EFailure::NoRoot, m_kFile.numSegments > 0 ? "Global" : "NumSegments");
+    if (!m_bHasMotion)
+        return Fail(EFailure::MissingSection, "[MOTION]");
+    return KeyTimesFit(m_kFile.frameCount, m_kFile.segments.size(), m_kLines.ByteCount()) ||
+           Fail(EFailure::BadCount, "EndFrame");
+}
+
+} // namespace gw
