@@ -1,0 +1,100 @@
+#pragma once
+
+#include "CPicInput.h"
+#include "CPicture.h"
+
+#include <array>
+#include <cstdint>
+#include <cstdio>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// What a BMP file begins with: 14 bytes, without gaps.
+struct CBMPFileHeader
+{
+    uint16_t type = 0;
+    uint32_t size = 0; ///< of the file
+    uint16_t reserved1 = 0;
+    uint16_t reserved2 = 0;
+    uint32_t offset = 0; ///< of the pixels
+};
+
+/// The 40 bytes behind it, as they stand.
+struct CBMPInfoHeader
+{
+    uint32_t size = 0; ///< of this header; larger ones have more fields behind it
+    int32_t width = 0;
+    int32_t height = 0; ///< negative where rows stand from top to bottom
+    uint16_t planes = 0;
+    uint16_t bitCount = 0;
+    uint32_t compression = 0;
+    uint32_t imageSize = 0;
+    int32_t xPixelsPerMeter = 0;
+    int32_t yPixelsPerMeter = 0;
+    uint32_t colorsUsed = 0;
+    uint32_t colorsImportant = 0;
+};
+
+/// A BMP file, read or written row by row. Uncompressed files of all depths are read, in both directions: a
+/// file that stands bottom up gives its bottom row as row 0, unless it comes as a stream, where row 0 is the
+/// top one. Rows of a stream that cannot go back must be asked for in the order in which they stand. Written
+/// are files of one channel or three, from the top row on.
+class CBMPPicture : public CPicture
+{
+public:
+    /// Null, with a message on standard error, for what cannot be read or written.
+    static CPicture* Open(const char* fileName, const char* mode);
+    explicit CBMPPicture(std::string name) : CPicture(std::move(name)) {}
+    ~CBMPPicture() override { CloseFile(); }
+
+    const char* MessageName() const override { return "picbmp"; }
+    bool Close() override;
+    int ChannelCount() const override { return m_iChannels; }
+    CPictureBox Box() const override { return {0, 0, m_iWidth, m_iHeight}; }
+    bool IsBottomFirst() const override { return m_bReading && !m_bTopDown && !m_kInput.IsStream(); }
+    bool ReadRow(int y, int x, int count, uint8_t* pixels) override;
+    bool ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels) override;
+    bool SetChannelCount(int count) override;
+    bool SetSize(const CPictureBox& box) override;
+    bool WriteRow(int y, int x, int count, const uint8_t* pixels) override;
+    bool WriteRowRGBA(int y, int x, int count, const CPixelRGBA* pixels) override;
+
+private:
+    bool OpenToRead();
+    bool OpenToWrite();
+
+    bool ReadHeader();
+    bool ReadFileHeader();
+    bool ReadInfoHeader();
+    bool TakeSize();
+    bool ReadPalette();
+    bool ReadRowBytes(int y, int x, int count);
+    uint8_t IndexAt(int x) const;
+    CPixelRGBA PixelAt(int x) const;
+
+    bool HasBegun() const { return m_iRow > 0; }
+    bool BeginRow(int y, int x, int count);
+    bool FinishRow();
+    bool WriteHeader();
+    uint8_t* ChannelsAt(int x);
+    void CloseFile();
+
+    CBMPFileHeader m_kFileHeader;
+    CBMPInfoHeader m_kInfoHeader;
+    std::array<CPixelRGBA, 256> m_kPalette{};
+    bool m_bReading = false;
+    bool m_bTopDown = false;
+    bool m_bFailed = false; // a write that the file system did not take
+    int m_iWidth = 0;
+    int m_iHeight = 0;
+    int m_iChannels = 3;
+    int m_iRow = 0;               // the row that is written next
+    uint32_t m_uiRowSize = 0;     // bytes of a row in the file
+    std::vector<uint8_t> m_kRow;  // the row at hand, as in the file
+    CPicInput m_kInput;           // of a picture that is read
+    std::FILE* m_pkOut = nullptr; // of one that is written
+};
+
+} // namespace gw

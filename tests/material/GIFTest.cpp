@@ -1,0 +1,329 @@
+// GIF files: known bytes, codes of every size from an encoder of the test's own, and damage.
+
+#include "CGIFReader.h"
+#include "CLZWDecoder.h"
+#include "CPicInput.h"
+#include "PicProcs.h"
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+#include <map>
+#include <random>
+#include <string>
+#include <vector>
+
+namespace gw {
+namespace {
+
+using Pixels = std::vector<uint8_t>;
+
+// How the encoder goes on when all codes are taken.
+enum class EFull
+{
+    Clear, ///< it begins anew
+    Keep,  ///< it goes on with the codes that it has
+};
+
+// Pixels as the bytes of LZW codes.
+std::string Encoded(const Pixels& pixels, unsigned pixelBits, EFull full)
+{
+    const unsigned clear = 1u << pixelBits;
+    std::map<std::string, unsigned> codes;
+    unsigned width = 0;
+    unsigned count = 0;
+    const auto begin = [&] {
+        codes.clear();
+        for (unsigned i = 0; i < clear; ++i)
+            codes[std::string(1, static_cast<char>(i))] = i;
+        count = clear + 2;
+        width = pixelBits + 1;
+    };
+    std::string bytes;
+    uint64_t bits = 0;
+    unsigned held = 0;
+    const auto put = [&](unsigned code) {
+        bits |= uint64_t{code} << held;
+        for (held += width; held >= 8; held -= 8, bits >>= 8)
+            bytes += static_cast<char>(bits);
+    };
+    begin();
+    put(clear);
+    std::string run;
+    for (const uint8_t pixel : pixels)
+    {
+        const std::string longer = run + static_cast<char>(pixel);
+        if (codes.contains(longer))
+        {
+            run = longer;
+            continue;
+        }
+        put(codes[run]);
+        if (count == 4096 && full == EFull::Clear)
+        {
+            put(clear);
+            begin();
+        }
+        else if (count < 4096)
+        {
+            // The reader makes its entries one code later than the writer.
+            if (count == 1u << width && width < 12)
+                ++width;
+            codes[longer] = count++;
+        }
+        run.assign(1, static_cast<char>(pixel));
+    }
+    put(codes[run]);
+    if (count == 1u << width && width < 12)
+        ++width;
+    put(clear + 1);
+    width = 8;
+    put(0);
+    return bytes;
+}
+
+std::string Word(unsigned value)
+{
+    return {static_cast<char>(value), static_cast<char>(value >> 8)};
+}
+
+std::string Blocks(const std::string& bytes)
+{
+    std::string blocks;
+    for (size_t at = 0; at < bytes.size(); at += 255)
+    {
+        const std::string block = bytes.substr(at, 255);
+        blocks += static_cast<char>(block.size()) + block;
+    }
+    return blocks + '\0';
+}
+
+// A palette whose entry i is (i, 2 i, 255 - i).
+std::string Palette(unsigned bits)
+{
+    std::string colors;
+    for (unsigned i = 0; i < 1u << bits; ++i)
+        colors += {static_cast<char>(i), static_cast<char>(2 * i), static_cast<char>(255 - i)};
+    return colors;
+}
+
+std::string Head(unsigned width, unsigned height, unsigned bits)
+{
+    return "GIF89a" + Word(width) + Word(height) + static_cast<char>(0x80 | (bits - 1)) +
+           std::string(2, '\0') + Palette(bits);
+}
+
+std::string Image(unsigned width, unsigned height, unsigned flags, unsigned bits, const std::string& codes)
+{
+    return std::string(",") + Word(0) + Word(0) + Word(width) + Word(height) + static_cast<char>(flags) +
+           static_cast<char>(bits) + Blocks(codes);
+}
+
+Pixels Random(size_t count, unsigned bits)
+{
+    std::mt19937 random(17);
+    Pixels pixels(count);
+    for (uint8_t& pixel : pixels)
+        pixel = static_cast<uint8_t>(random() & ((1u << bits) - 1));
+    return pixels;
+}
+
+// The first image of a file in memory, with a block of its own, so that nothing behind it can be read unseen.
+bool ReadFirst(const std::string& file, CGIFImage& image)
+{
+    const std::vector<char> bytes(file.begin(), file.end());
+    CPicInput input(std::as_bytes(std::span(bytes)));
+    CGIFReader reader(input);
+    return reader.ReadHeader() && reader.ReadImage(image);
+}
+
+size_t PixelCount(const CGIFImage& image)
+{
+    return static_cast<size_t>(image.box.width) * static_cast<size_t>(image.box.height);
+}
+
+// A known file of 10 by 10 pixels in four colours.
+const std::string
+    kKnown("GIF89a\x0a\0\x0a\0\x91\0\0\xff\xff\xff\xff\0\0\0\0\xff\0\0\0!\xf9\x04\0\0\0\0\0,\0\0\0\0\x0a\0"
+           "\x0a\0\0\x02\x16\x8c-\x99\x87*\x1c\xdc"
+           "3\xa0\x02u\xec\x95\xfa\xa8\xde`\x8c\x04\x91L\x01\0;",
+           69);
+
+TEST(CGIFReader, ReadsAKnownFile)
+{
+    CGIFImage image;
+    ASSERT_TRUE(ReadFirst(kKnown, image));
+    const char* const rows[] = {"1111122222", "1111122222", "1111122222", "1110000222", "1110000222",
+                                "2220000111", "2220000111", "2222211111", "2222211111", "2222211111"};
+    std::string expected;
+    for (const char* row : rows)
+        expected += row;
+    std::string found;
+    for (const uint8_t pixel : image.pixels)
+        found += static_cast<char>('0' + pixel);
+    EXPECT_EQ(found, expected);
+    EXPECT_EQ(image.palette[1], (CPixelRGBA{255, 0, 0, 255}));
+    EXPECT_EQ(image.palette[2], (CPixelRGBA{0, 0, 255, 255}));
+}
+
+TEST(CGIFReader, ReadsCodesOfEverySize)
+{
+    for (unsigned bits = 1; bits <= 8; ++bits)
+    {
+        for (const EFull full : {EFull::Clear, EFull::Keep})
+        {
+            for (const Pixels& pixels : {Random(70000, bits), Pixels(70000, uint8_t{1}), Random(1, bits)})
+            {
+                SCOPED_TRACE(std::to_string(bits) + " bits, " + std::to_string(pixels.size()));
+                const unsigned width = pixels.size() == 1 ? 1 : 700;
+                const auto height = static_cast<unsigned>(pixels.size()) / width;
+                CGIFImage image;
+                ASSERT_TRUE(ReadFirst(Head(width, height, bits) +
+                                          Image(width, height, 0, bits, Encoded(pixels, bits, full)),
+                                      image));
+                EXPECT_TRUE(image.pixels == pixels);
+            }
+        }
+    }
+}
+
+TEST(CGIFReader, PutsInterlacedRowsInOrder)
+{
+    for (const unsigned height : {1u, 2u, 3u, 5u, 8u, 9u, 21u})
+    {
+        Pixels stored;
+        for (const auto& [first, step] : {
+                 std::pair(0u, 8u), {4u, 8u},
+                   {2u, 4u},
+                   {1u, 2u}
+        })
+        {
+            for (unsigned y = first; y < height; y += step)
+                stored.insert(stored.end(), 2, static_cast<uint8_t>(y));
+        }
+        CGIFImage image;
+        ASSERT_TRUE(ReadFirst(Head(2, height, 8) + Image(2, height, 0x40, 8, Encoded(stored, 8, EFull::Keep)),
+                              image));
+        for (unsigned y = 0; y < height; ++y)
+            EXPECT_EQ(image.pixels[2 * y + 1], y) << height;
+    }
+}
+
+TEST(CGIFReader, WalksTheBlocksToEachImage)
+{
+    const std::string comment =
+        "!\xfe" + Blocks("by hand") + "!\xff" + Blocks("PROGRAM1.0") + "!\x01" + Blocks("");
+    const std::string control = "!\xf9\x04\x09" + Word(0x1234) + std::string("\x03\0", 2);
+    const std::string codes = Encoded({3, 2}, 2, EFull::Keep);
+    const std::string ownColors = std::string(",") + Word(5) + Word(6) + Word(2) + Word(1) + "\x81" +
+                                  Palette(2) + "\x02" + Blocks(codes);
+    const std::string file = Head(9, 9, 8) + comment + control + Image(2, 1, 0, 2, codes) + ownColors + ";";
+    CPicInput input(std::as_bytes(std::span(file)));
+    CGIFReader reader(input);
+    ASSERT_TRUE(reader.ReadHeader());
+    EXPECT_EQ(reader.ScreenWidth(), 9);
+
+    CGIFImage image;
+    ASSERT_TRUE(reader.ReadImage(image));
+    EXPECT_EQ(image.delay, 0x1234);
+    EXPECT_EQ(image.disposal, 2);
+    EXPECT_EQ(image.palette[3], (CPixelRGBA{3, 6, 252, 0})) << "transparent";
+    EXPECT_EQ(image.palette[255], (CPixelRGBA{255, 254, 0, 255}));
+    ASSERT_TRUE(reader.ReadImage(image));
+    EXPECT_EQ(image.delay, 0) << "a control extension is for one image";
+    EXPECT_EQ(image.box.x, 5);
+    EXPECT_EQ(image.box.y, 6);
+    EXPECT_EQ(image.palette[3], (CPixelRGBA{3, 6, 252, 255}));
+    EXPECT_EQ(image.palette[255], (CPixelRGBA{0, 0, 0, 255})) << "a table of its own, of four";
+    EXPECT_FALSE(reader.ReadImage(image)) << "the trailer";
+}
+
+TEST(CGIFReader, RefusesDamage)
+{
+    const std::string head = Head(2, 1, 2);
+    const std::string codes = Encoded({3, 2}, 2, EFull::Keep);
+    const auto reads = [](const std::string& file) {
+        CGIFImage image;
+        return ReadFirst(file, image);
+    };
+    const std::string image = Image(2, 1, 0, 2, codes);
+    EXPECT_TRUE(reads(head + image));
+    EXPECT_TRUE(reads("GIF87a" + head.substr(6) + image)) << "the old version";
+    EXPECT_TRUE(reads(head + Image(2, 1, 0, 2, codes + "more"))) << "bytes behind the end code";
+    EXPECT_FALSE(reads("GIG89a" + head.substr(6) + image)) << "another name";
+    EXPECT_FALSE(reads("GIF88a" + head.substr(6) + image)) << "another version";
+    EXPECT_FALSE(reads(head + ";")) << "no image";
+    EXPECT_FALSE(reads(head + "x" + image)) << "a block that there is not";
+    EXPECT_FALSE(reads(head + "!\xf9\x02" + std::string(3, '\0') + image)) << "a short control extension";
+    EXPECT_FALSE(reads(head + Image(0, 1, 0, 2, codes))) << "no pixels";
+    EXPECT_FALSE(reads(head + Image(65535, 65535, 0, 2, codes))) << "more pixels than any screen";
+    EXPECT_FALSE(reads(head + Image(2, 1, 0, 0, codes))) << "pixels of no bits";
+    EXPECT_FALSE(reads(head + Image(2, 1, 0, 9, codes))) << "pixels of nine bits";
+    EXPECT_FALSE(reads(head + Image(2, 2, 0, 2, codes))) << "fewer pixels than its size";
+    // Three bits a code: clear and a pixel, then a code that is not made yet; clear and what is no pixel.
+    EXPECT_FALSE(reads(head + Image(2, 1, 0, 2, std::string("\xdc\x01", 2)))) << "a code of later";
+    EXPECT_FALSE(reads(head + Image(2, 1, 0, 2, std::string("\x34\0", 2))))
+        << "a first code that is no pixel";
+}
+
+TEST(CGIFReader, SurvivesEveryBeginningAndEveryByte)
+{
+    for (size_t end = 0; end < kKnown.size(); ++end)
+    {
+        CGIFImage image;
+        EXPECT_EQ(ReadFirst(kKnown.substr(0, end), image), end + 2 >= kKnown.size()) << end;
+    }
+    const std::string large =
+        Head(70, 60, 3) + Image(70, 60, 0x40, 3, Encoded(Random(4200, 3), 3, EFull::Clear));
+    for (const std::string& good : {kKnown, large})
+    {
+        for (size_t at = 0; at < good.size(); ++at)
+        {
+            for (const int change : {0x01, 0x80, 0xff})
+            {
+                std::string bad = good;
+                bad[at] = static_cast<char>(bad[at] ^ change);
+                CGIFImage image;
+                const bool read = ReadFirst(bad, image);
+                EXPECT_TRUE(!read || image.pixels.size() == PixelCount(image)) << at;
+            }
+        }
+    }
+}
+
+TEST(CGIFPicture, IsADriverThatOnlyReads)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("a.gif");
+    WriteBytes(path, kKnown);
+    const PicProcs* gif = FindPictureDriver("gif");
+    ASSERT_TRUE(gif);
+    CPicture* const picture = gif->open(path.c_str(), "r");
+    ASSERT_TRUE(picture);
+    EXPECT_EQ(gif->getBox(picture).height, 10);
+    uint8_t indices[3];
+    ASSERT_TRUE(gif->readRow(picture, 3, 2, 3, indices));
+    EXPECT_EQ(indices[0] * 100 + indices[1] * 10 + indices[2], 100);
+    CPixelRGBA pixels[2];
+    ASSERT_TRUE(gif->readRowRGBA(picture, 9, 8, 2, pixels));
+    EXPECT_EQ(pixels[1], (CPixelRGBA{255, 0, 0, 255}));
+    EXPECT_FALSE(gif->readRow(picture, 10, 0, 1, indices));
+    EXPECT_FALSE(gif->readRowRGBA(picture, 0, 9, 2, pixels));
+    EXPECT_FALSE(gif->writeRow(picture, 0, 0, 1, indices));
+    EXPECT_FALSE(gif->nextPicture(picture));
+    EXPECT_TRUE(gif->readRow(picture, 0, 0, 3, indices)) << "the image at hand stays";
+
+    testing::internal::CaptureStderr();
+    gif->writePixel(picture, 0, 0, 1);
+    gif->writePixelRGBA(picture, 0, 0, {});
+    gif->readPixel(picture, 0, 0);
+    gif->readPixelRGBA(picture, 0, 0);
+    EXPECT_FALSE(gif->open(path.c_str(), "w"));
+    EXPECT_EQ(testing::internal::GetCapturedStderr(),
+              "?gif_write_pixel\n?gif_write_pixel_rgba\n?gif_read_pixel\n?gif_read_pixel_rgba\n"
+              "?GIF output not supported.\n");
+    gif->close(picture);
+    EXPECT_EQ(ReadBytes(path), kKnown);
+}
+
+} // namespace
+} // namespace gw
