@@ -349,6 +349,12 @@ void AppendFixed6(std::string& out, float value)
     out.append(text, WriteFixed6(text, value));
 }
 
+void AppendFixed3(std::string& out, float value)
+{
+    char text[kFixed6Bytes];
+    out.append(text, std::to_chars(text, std::end(text), value, std::chars_format::fixed, 3).ptr);
+}
+
 void AppendInt(std::string& out, int32_t value)
 {
     char text[kIntBytes];

@@ -46,6 +46,8 @@ inline constexpr size_t kIntBytes = 12;
 char* WriteInt(char* out, int32_t value);
 
 void AppendFixed6(std::string& out, float value);
+/// The same with three decimals, as "%.3f" does, for what is only looked at.
+void AppendFixed3(std::string& out, float value);
 void AppendInt(std::string& out, int32_t value);
 
 } // namespace gw

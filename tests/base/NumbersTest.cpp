@@ -61,10 +61,17 @@ std::string Fixed6(float value)
     return text;
 }
 
-std::string Printed(float value)
+std::string Fixed3(float value)
+{
+    std::string text;
+    AppendFixed3(text, value);
+    return text;
+}
+
+std::string Printed(float value, int decimals = 6)
 {
     char text[64];
-    std::snprintf(text, sizeof text, "%f", static_cast<double>(value));
+    std::snprintf(text, sizeof text, "%.*f", decimals, static_cast<double>(value));
     return text;
 }
 
@@ -220,7 +227,10 @@ TEST(Numbers, FloatsPrintAsTheLibraryPrintsThem)
          {0.0f, kInfinity, kNan, FLT_MAX, FLT_TRUE_MIN, 0x1p40f, 0x1p24f, 5e-7f, 1000.0f, 1e6f})
     {
         for (const float v : {value, -value, std::nextafter(value, 0.0f), std::nextafter(value, kInfinity)})
+        {
             EXPECT_EQ(Fixed6(v), Printed(v));
+            EXPECT_EQ(Fixed3(v), Printed(v, 3));
+        }
     }
     std::mt19937_64 random(2);
     for (int i = 0; i < 1000000; ++i)
@@ -252,6 +262,7 @@ TEST(Numbers, TheLocaleOfTheDesktopHasNoSay)
         EXPECT_EQ(Printed(1.5f), "1,500000"); // so that the rest says something
         EXPECT_EQ(Fixed6(1234.5f), "1234.500000");
         EXPECT_EQ(Fixed6(1e15f), "999999986991104.000000");
+        EXPECT_EQ(Fixed3(1234.5f), "1234.500");
         EXPECT_EQ(ParseDouble("1.5e0"), 1.5);
         EXPECT_EQ(ReadFront(CBlock("1.5")).value, 1.5f);
         EXPECT_EQ(ReadFront(CBlock("1,5")).value, 1.0f);
