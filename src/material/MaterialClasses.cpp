@@ -1,4 +1,5 @@
 #include "CAnmImage.h"
+#include "CAnmImageControl.h"
 #include "CBlendMaterial.h"
 #include "CFactoryMap.h"
 #include "CImage.h"
@@ -25,6 +26,7 @@ constexpr CFactoryRow kClasses[] = {
     {&CMultiTex::ms_kRTTI,         MakeNothing                  },
     {&CImage::ms_kRTTI,            MakeObject<CImage>           },
     {&CAnmImage::ms_kRTTI,         MakeObject<CAnmImage>        },
+    {&CAnmImageControl::ms_kRTTI,  MakeObject<CAnmImageControl> },
     {&CSprite::ms_kRTTI,           MakeObject<CSprite>          },
     {&CNormalBumpTex::ms_kRTTI,    MakeObject<CNormalBumpTex>   },
 };

@@ -1,4 +1,5 @@
 #include "CAnmImage.h"
+#include "CAnmImageControl.h"
 #include "CImage.h"
 #include "MaterialSamples.h"
 #include "Paths.h"
@@ -246,6 +247,60 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
     EXPECT_EQ(first->Pixels().GetWidth(), 2);
     EXPECT_FALSE(film->Load(folder.Path("none.gif")));
     EXPECT_EQ(film->GetFrameCount(), 0u);
+}
+
+namespace {
+
+// A picture of one pixel.
+Ref<CImage> Dot(uint8_t shade)
+{
+    Ref<CImage> image = new CImage;
+    const uint8_t color[4] = {shade, shade, shade, 255};
+    image->Pixels().Create(1, 1, 0, color);
+    return image;
+}
+
+} // namespace
+
+TEST(CAnmImageControl, DrawsTheFrameOfItsTimeAtItsPlace)
+{
+    const Ref<CAnmImage> film = new CAnmImage;
+    film->AddFrame({0, 50, 0, 0, {}, Dot(10).Get()});
+    film->AddFrame({0, 7, 1, 0, {}, Dot(20).Get()}); // begins after its own delay: at 70
+    film->AddFrame({0, 2, 2, 0, {}, nullptr});       // at 90, and shows nothing
+    const Ref<CImage> screen = new CImage;
+    const uint8_t black[4] = {0, 0, 0, 255};
+    screen->Pixels().Create(3, 1, 0, black);
+    const Ref<CAnmImageControl> control = new CAnmImageControl;
+    control->m_fEndTime = 1000.0f;
+    ASSERT_TRUE(screen->AttachControl(control.Get()));
+    EXPECT_FALSE(control->Update(0.0f)) << "without a film";
+    control->SetFilm(film.Get());
+    const struct
+    {
+        const char* what;
+        float time;
+        std::array<uint8_t, 3> shades;
+    } rows[] = {
+        {"before the second frame", 69.0f,  {10, 0, 0} },
+        {"with it",                 70.0f,  {0, 20, 0} },
+        {"with the empty one",      500.0f, {0, 0, 0}  },
+        {"back again",              1.0f,   {10, 0, 0} },
+    };
+    uint32_t stamp = screen->m_uiChangeStamp;
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        screen->Pixels().Create(3, 1, 0, black);
+        EXPECT_TRUE(control->Update(row.time));
+        EXPECT_EQ(screen->m_uiChangeStamp, ++stamp);
+        const CPixelView view(screen->Pixels());
+        for (size_t x = 0; x < 3; ++x)
+            EXPECT_EQ(view.Row(0)[4 * x], row.shades[x]);
+    }
+    control->m_bActive = false;
+    EXPECT_FALSE(control->Update(70.0f));
+    EXPECT_EQ(screen->m_uiChangeStamp, stamp);
 }
 
 } // namespace gw

@@ -1,4 +1,5 @@
 #include "CAnmImage.h"
+#include "CAnmImageControl.h"
 #include "CBlendMaterial.h"
 #include "CImage.h"
 #include "CMultiMaterial.h"
@@ -87,6 +88,13 @@ TEST(MaterialFile, EveryClassIsWrittenAsTheFormatSays)
     bytes = Scene().Root().Object("CAnmImage", 1).Text("");
     bytes.Words({1, 1, 2, uint32_t(-3), 4, 0x070605, 0});
     ExpectBytes(film, bytes);
+
+    const Ref<CAnmImageControl> control = new CAnmImageControl;
+    control->SetFilm(film.Get());
+    bytes = Scene().Root().Object("CAnmImageControl", 1).Word(0).Float(0).Float(0).Float(0).Float(1).Byte(1);
+    bytes.Words({0, 0, 2}).Object("CAnmImage", 2).Text("");
+    bytes.Words({1, 1, 2, uint32_t(-3), 4, 0x070605, 0});
+    ExpectBytes(control, bytes);
 }
 
 TEST(MaterialFile, EveryValueComesBackInEveryVersion)
