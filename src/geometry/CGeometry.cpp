@@ -1,6 +1,7 @@
 #include "CGeometry.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 #include "CMaterialBase.h"
 
 #include <algorithm>
@@ -32,6 +33,12 @@ void CGeometry::Fields(CFieldArchive& archive)
         return;
     m_kWorldXYZ.resize(m_kXYZ.size());
     m_kWorldNormal.resize(m_kNormal.size());
+}
+
+void CGeometry::DumpTable(CHTMLTables& tables)
+{
+    CSpatial::DumpTable(tables);
+    tables.OwnFields<CGeometry, CSpatial>(*this);
 }
 
 uint64_t CGeometry::GetMemoryUsed() const

@@ -22,6 +22,7 @@ public:
     ~CGeometry() override;
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
     /// Copies the model points, runs the controls, and brings to the world what they left in model space.
     bool Update(float time) override;

@@ -1,6 +1,7 @@
 #include "CTriMesh.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 #include "CTriMeshUVWMap.h"
 
 #include <algorithm>
@@ -79,6 +80,12 @@ void CTriMesh::Fields(CFieldArchive& archive)
         fields.Signed("m_iFaceStart", range.m_iFaceStart);
         fields.Signed("m_iFaceCount", range.m_iFaceCount);
     });
+}
+
+void CTriMesh::DumpTable(CHTMLTables& tables)
+{
+    CGeometry::DumpTable(tables);
+    tables.OwnFields<CTriMesh, CGeometry>(*this);
 }
 
 uint64_t CTriMesh::GetMemoryUsed() const

@@ -27,6 +27,7 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;

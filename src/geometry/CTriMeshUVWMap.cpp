@@ -1,6 +1,7 @@
 #include "CTriMeshUVWMap.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 namespace gw {
 
@@ -20,6 +21,12 @@ void CTriMeshUVWMap::Fields(CFieldArchive& archive)
     archive.OptionalBlock("UVWTriIndexBuffer", m_kUVWTriIndex, int64_t{3} * m_iTriangleCount);
     archive.Signed("VertexUVWMap count", m_iVertexCount);
     archive.OptionalBlock("VertexUVWMap", m_kVertexUVW, m_iVertexCount);
+}
+
+void CTriMeshUVWMap::DumpTable(CHTMLTables& tables)
+{
+    CObject::DumpTable(tables);
+    tables.OwnFields<CTriMeshUVWMap, CObject>(*this);
 }
 
 uint64_t CTriMeshUVWMap::GetMemoryUsed() const

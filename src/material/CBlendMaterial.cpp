@@ -1,6 +1,7 @@
 #include "CBlendMaterial.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 namespace gw {
 
@@ -21,6 +22,12 @@ void CBlendMaterial::Fields(CFieldArchive& archive)
     archive.Float("m_fBlend", m_fBlend);
     archive.Link("m_spkMask", m_spkMask);
     archive.LinkRow("m_aspkMtl", m_aspkMtl);
+}
+
+void CBlendMaterial::DumpTable(CHTMLTables& tables)
+{
+    CMaterial::DumpTable(tables);
+    tables.OwnFields<CBlendMaterial, CMaterial>(*this);
 }
 
 uint64_t CBlendMaterial::GetMemoryUsed() const

@@ -18,6 +18,7 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
     float m_fBlend = 0.0f;

@@ -1,6 +1,7 @@
 #include "CMaterialBase.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 namespace gw {
 
@@ -11,6 +12,12 @@ void CMaterialBase::Fields(CFieldArchive& archive)
 {
     CObject::Fields(archive);
     archive.Bool("m_bTwoSided", m_bTwoSided);
+}
+
+void CMaterialBase::DumpTable(CHTMLTables& tables)
+{
+    CObject::DumpTable(tables);
+    tables.OwnFields<CMaterialBase, CObject>(*this);
 }
 
 uint64_t CMaterialBase::GetMemoryUsed() const

@@ -13,6 +13,7 @@ public:
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
     bool m_bTwoSided = false; ///< stored and copied only

@@ -1,6 +1,7 @@
 #include "CMultiMaterial.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 namespace gw {
 
@@ -19,6 +20,12 @@ void CMultiMaterial::Fields(CFieldArchive& archive)
 {
     CMaterial::Fields(archive);
     archive.Links("m_kSubMaterials", m_kSubMaterials);
+}
+
+void CMultiMaterial::DumpTable(CHTMLTables& tables)
+{
+    CMaterial::DumpTable(tables);
+    tables.OwnFields<CMultiMaterial, CMaterial>(*this);
 }
 
 uint64_t CMultiMaterial::GetMemoryUsed() const

@@ -1,6 +1,7 @@
 #include "CNormalBumpTex.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 namespace gw {
 
@@ -24,6 +25,12 @@ void CNormalBumpTex::Fields(CFieldArchive& archive)
     archive.Float("m_fSecondAmount", m_fSecondAmount);
     archive.Link("m_spkFirstMap", m_spkFirstMap);
     archive.Link("m_spkSecondMap", m_spkSecondMap);
+}
+
+void CNormalBumpTex::DumpTable(CHTMLTables& tables)
+{
+    CTexture::DumpTable(tables);
+    tables.OwnFields<CNormalBumpTex, CTexture>(*this);
 }
 
 uint64_t CNormalBumpTex::GetMemoryUsed() const

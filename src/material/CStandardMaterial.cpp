@@ -1,6 +1,7 @@
 #include "CStandardMaterial.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 
 #include <algorithm>
 #include <span>
@@ -43,6 +44,12 @@ void CStandardMaterial::Fields(CFieldArchive& archive)
     std::vector<Held<CTexture>> surplus(count - stored.size());
     if (!surplus.empty())
         archive.LinkRow("surplus", surplus);
+}
+
+void CStandardMaterial::DumpTable(CHTMLTables& tables)
+{
+    CMaterial::DumpTable(tables);
+    tables.OwnFields<CStandardMaterial, CMaterial>(*this);
 }
 
 uint64_t CStandardMaterial::GetMemoryUsed() const

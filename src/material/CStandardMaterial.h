@@ -38,6 +38,7 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
     Vec3 m_kAmbient{0.2f, 0.2f, 0.2f};

@@ -1,6 +1,7 @@
 #include "CTextureMap.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
 #include "CImage.h"
 
 namespace gw {
@@ -21,6 +22,12 @@ void CTextureMap::Fields(CFieldArchive& archive)
     CTexture::Fields(archive);
     archive.Signed("m_iUVWChannel", m_iUVWChannel);
     archive.Link("m_spkImage", m_spkImage);
+}
+
+void CTextureMap::DumpTable(CHTMLTables& tables)
+{
+    CTexture::DumpTable(tables);
+    tables.OwnFields<CTextureMap, CTexture>(*this);
 }
 
 uint64_t CTextureMap::GetMemoryUsed() const

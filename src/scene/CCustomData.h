@@ -19,6 +19,8 @@ public:
     ~CCustomData() override;
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
+    /// Custom data has no tables, and nothing leads to a page of it.
+    void DumpTable(CHTMLTables&) override {}
     uint64_t GetMemoryUsed() const override;
 
     /// Stores a copy of a free text, or null, and the version as major x 100 + minor.

@@ -1,6 +1,8 @@
 #include "CLight.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
+#include "HTMLText.h"
 
 namespace gw {
 
@@ -15,6 +17,14 @@ void CLight::Fields(CFieldArchive& archive)
     archive.Bool("m_bLightOn", m_bLightOn);
 }
 
+void CLight::DumpTable(CHTMLTables& tables)
+{
+    CSpatial::DumpTable(tables);
+    tables.Begin(ms_kRTTI);
+    tables.Row("m_kRGB", HTMLText(m_kRGB));
+    tables.Row("m_fIntensity", HTMLText(m_fIntensity));
+}
+
 uint64_t CLight::GetMemoryUsed() const
 {
     return CSpatial::GetMemoryUsed() + 20;
@@ -24,6 +34,14 @@ void CPointLight::Fields(CFieldArchive& archive)
 {
     CLight::Fields(archive);
     archive.Vector("m_kLocation", m_kLocation);
+}
+
+void CPointLight::DumpTable(CHTMLTables& tables)
+{
+    CLight::DumpTable(tables);
+    tables.Begin(ms_kRTTI);
+    tables.Row("m_kLocation", HTMLText(m_kLocation));
+    tables.Row("m_kWorldLocation", HTMLText(m_kWorldLocation));
 }
 
 uint64_t CPointLight::GetMemoryUsed() const

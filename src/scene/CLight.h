@@ -12,6 +12,7 @@ public:
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
     void UpdateBound() override {}
     void ApplyRenderStates(RenderStateStack&) override {}
@@ -31,6 +32,7 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override { return new CPointLight(*this); }
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     uint32_t GetLightType() const override { return 2; }

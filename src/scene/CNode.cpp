@@ -1,6 +1,9 @@
 #include "CNode.h"
 
 #include "CFieldArchive.h"
+#include "CHTMLDump.h"
+#include "CHTMLTables.h"
+#include "HTMLMarkup.h"
 
 #include <algorithm>
 
@@ -60,6 +63,26 @@ void CNode::Link(COrrinStream& stream, CLinkRecord& record)
         if (child)
             child->SetParent(this);
     }
+}
+
+void CNode::WriteHTMLFrames(const std::string& folder)
+{
+    CHTMLDump(folder).WriteSite(*this);
+}
+
+void CNode::DumpTable(CHTMLTables& tables)
+{
+    CSpatial::DumpTable(tables);
+    std::string children;
+    for (const auto& child : m_kChild)
+    {
+        if (!child)
+            continue;
+        children += HTMLLineBreak() + HTMLObjectAnchor(child.Get());
+        tables.Follow(*child);
+    }
+    tables.Begin(ms_kRTTI);
+    tables.Row("m_kChild", children);
 }
 
 uint64_t CNode::GetMemoryUsed() const

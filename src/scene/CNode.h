@@ -17,6 +17,8 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
+    void WriteHTMLFrames(const std::string& folder) override;
+    void DumpTable(CHTMLTables& tables) override;
     void Link(COrrinStream& stream, CLinkRecord& record) override;
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;

@@ -3,9 +3,14 @@
 #include "CControl.h"
 #include "CCustomData.h"
 #include "CFieldArchive.h"
+#include "CHTMLDump.h"
+#include "CHTMLTables.h"
 #include "COrrinStream.h"
+#include "HTMLMarkup.h"
+#include "HTMLText.h"
 
 #include <cstring>
+#include <unordered_set>
 
 namespace gw {
 
@@ -185,6 +190,28 @@ bool CObject::Register(COrrinStream& stream)
 void CObject::Save(COrrinStream& stream)
 {
     stream.WriteObject(*this);
+}
+
+void CObject::DumpHTML(const std::string& folder, COrnHTMLWriter& page)
+{
+    CHTMLDump(folder).Fill(page, *this);
+}
+
+void CObject::DumpTable(CHTMLTables& tables)
+{
+    std::string controls;
+    std::unordered_set<const CControl*> shown; // nobody has checked a chain made by hand
+    for (CControl* control = GetControl(); control && shown.insert(control).second;
+         control = control->GetNext())
+    {
+        controls += HTMLLineBreak() + HTMLAnchor(GetHTMLFileName(*control, EHTMLPath::Relative),
+                                                 control->GetRTTI()->m_pcName);
+        tables.Follow(*control);
+    }
+    tables.Begin(ms_kRTTI);
+    tables.Row(kHTMLObjectName, m_pcName.IsNull() ? "NoName" : HTMLText(NameView()));
+    tables.Row(kHTMLControls, controls);
+    tables.Row(kHTMLObjectID, HTMLUnsigned(m_uiID));
 }
 
 uint64_t CObject::GetMemoryUsed() const

@@ -6,6 +6,7 @@
 
 #include <cstdint>
 #include <map>
+#include <string>
 #include <string_view>
 #include <vector>
 
@@ -14,6 +15,8 @@ namespace gw {
 class CControl;
 class CCustomData;
 class CFieldArchive;
+class CHTMLTables;
+class COrnHTMLWriter;
 class COrrinStream;
 class CWatcher;
 struct CLinkRecord;
@@ -62,6 +65,15 @@ public:
     /// Enters the object and all that it holds in the stream's save list; false when it was known already.
     virtual bool Register(COrrinStream& stream);
     virtual void Save(COrrinStream& stream);
+
+    /// Writes a small web site about this object and all below it, for developers. Only nodes do. The folder
+    /// stands straight before each file name, so it ends in a separator.
+    virtual void WriteHTMLFrames(const std::string&) {}
+    /// Puts the object's tables on a page, and saves the pages of all that it leads to, each once.
+    void DumpHTML(const std::string& folder, COrnHTMLWriter& page);
+    /// The class's table on such a page, base first.
+    virtual void DumpTable(CHTMLTables& tables);
+
     /// Bytes in memory, by the fixed sizes of the object model.
     virtual uint64_t GetMemoryUsed() const;
     /// The bytes that Save writes, exactly.

@@ -3,6 +3,9 @@
 #include "CControl.h"
 #include "CCustomData.h"
 #include "CFieldArchive.h"
+#include "CHTMLTables.h"
+#include "HTMLMarkup.h"
+#include "HTMLText.h"
 
 namespace gw {
 
@@ -33,6 +36,16 @@ void CSpatial::Fields(CFieldArchive& archive)
     archive.Matrix("m_kMatrix", m_kMatrix);
     archive.Bool("m_bStoredFlag", m_bStoredFlag);
     archive.Links("m_pkRenderStates", m_pkRenderStates);
+}
+
+void CSpatial::DumpTable(CHTMLTables& tables)
+{
+    CObject::DumpTable(tables);
+    tables.Begin(ms_kRTTI);
+    tables.Row("Parent", HTMLObjectAnchor(m_pkParent));
+    tables.Row("m_kMatrix", HTMLText(m_kMatrix));
+    tables.Row("m_kWorldMatrix", HTMLText(m_kWorldMatrix));
+    tables.Row("m_bForceCull", HTMLText(m_bForceCull));
 }
 
 uint64_t CSpatial::GetMemoryUsed() const

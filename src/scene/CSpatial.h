@@ -31,6 +31,7 @@ public:
     ~CSpatial() override;
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
+    void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;

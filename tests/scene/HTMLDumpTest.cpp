@@ -1,0 +1,287 @@
+#include "CCamera.h"
+#include "CCustomData.h"
+#include "CLight.h"
+#include "COrnHTMLPage.h"
+#include "HTMLMarkup.h"
+#include "HTMLText.h"
+#include "Paths.h"
+#include "SceneSamples.h"
+#include "TempFolder.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+#include <cfloat>
+#include <filesystem>
+#include <limits>
+
+namespace gw {
+namespace {
+
+using testing::HasSubstr;
+
+class HTMLDump : public testing::Test
+{
+protected:
+    std::string Page(const std::string& name) const { return ReadBytes(m_kFolder.Path(name)); }
+    std::string PageOf(const CObject& object) const { return Page(GetHTMLFileName(object, EHTMLPath::Bare)); }
+    size_t FileCount() const
+    {
+        const std::filesystem::directory_iterator files(m_kFolder.Path());
+        return static_cast<size_t>(std::distance(begin(files), end(files)));
+    }
+
+    CTempFolder m_kFolder;
+};
+
+Ref<CNode> Node(const char* name)
+{
+    Ref<CNode> node = new CNode;
+    node->SetName(name);
+    return node;
+}
+
+std::string ID(const CObject& object)
+{
+    return std::to_string(object.GetID());
+}
+
+constexpr char kIdentity[] = "[(1.000, 0.000, 0.000, 0.000),(0.000, 1.000, 0.000, 0.000),"
+                             "(0.000, 0.000, 1.000, 0.000),(0.000, 0.000, 0.000, 1.000)]";
+
+} // namespace
+
+TEST_F(HTMLDump, FramesTreeAndPagesAreWrittenAsTold)
+{
+    const Ref<CNode> root = Node(nullptr);
+    const Ref<CNode> hips = new CBillboardNode;
+    hips->SetName("Hips");
+    root->AttachChild(hips.Get());
+    root->AttachChild(new CCamera);
+    hips->AttachChild(Node("Chest").Get());
+    const CNode& chest = static_cast<CNode&>(*hips->ChildAt(0));
+    root->WriteHTMLFrames(m_kFolder.Path());
+
+    EXPECT_EQ(Page("Index.htm"),
+              "<html>\n<head>\n<title>TKOrrin TreeView</title>\n"
+              "<meta http-equiv=\"Content-Type\" content=\"text/html; charset=big5\">\n</head>\n"
+              "<frameset cols=\"300,*\" frameborder=\"YES\" border=\"1\" framespacing=\"0\" rows=\"*\">\n"
+              "<frame name=\"leftFrame\" scrolling=\"auto\" src=\"TreeView.htm\">\n"
+              "<frame name=\"mainFrame\" src=\"OrnHTML" +
+                  ID(*root) +
+                  ".htm\">\n"
+                  "</frameset>\n<noframes>\n<body bgcolor=\"#FFFFFF\">\n</body>\n</noframes>\n</html>\n");
+    const std::string rootNode = "Node" + ID(*root);
+    const std::string hipsNode = "Node" + ID(*hips);
+    EXPECT_EQ(Page("TreeView.htm"),
+              "<html>\n<head>\n<title>\xA4\xBA\xAE\x65</title>\n"
+              "<meta http-equiv=\"Content-Type\" content=\"text/html; charset=big5\">\n"
+              "<script language=\"JavaScript\" src=\"TreeView.js\">\n</script>\n</head>\n"
+              "<body bgcolor=\"#FFFFFF\">\n<script language=\"JavaScript\">\n<!--\n" +
+                  rootNode + " = gFld(\"\", \"OrnHTML" + ID(*root) + ".htm target=mainFrame\");\n" +
+                  hipsNode + " = insFld(" + rootNode + ", gFld(\"Hips\", \"OrnHTML" + ID(*hips) +
+                  ".htm target=mainFrame\"));\n" + "Node" + ID(chest) + " = insFld(" + hipsNode +
+                  ", gFld(\"Chest\", \"OrnHTML" + ID(chest) + ".htm target=mainFrame\"));\n" +
+                  "initializeDocument(" + rootNode + ")\n-->\n</script>\n</body>\n</html>\n");
+    EXPECT_EQ(FileCount(), 6u) << "two frames, four objects";
+
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_EQ(FileCount(), 6u) << "a second dump replaces the first";
+    const Ref<CNode> empty = Node("Alone");
+    empty->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_THAT(Page("TreeView.htm"),
+                HasSubstr("<!--\nNode" + ID(*empty) + " = gFld(\"Alone\", \"OrnHTML" + ID(*empty) +
+                          ".htm target=mainFrame\");\ninitializeDocument(Node" + ID(*empty) + ")\n-->"));
+    new CCamera; // takes an id, so that the next one is another
+}
+
+TEST_F(HTMLDump, APageHasTheTablesOfAllClassesOfItsObject)
+{
+    const Ref<CNode> root = TrackedNode({0, 1});
+    root->SetName(nullptr);
+    root->m_bForceCull = true;
+    root->m_kMatrix.SetTranslation({0.0005f, -1234.5678f, 7});
+    const Ref<CPointLight> light = new CPointLight;
+    light->SetName("Lamp");
+    light->m_kLocation = {1, 2, 3};
+    light->m_fIntensity = FLT_MAX;
+    root->AttachChild(light.Get());
+    root->WriteHTMLFrames(m_kFolder.Path());
+
+    const std::string caption = "<TABLE BORDER=\"3\"><CAPTION>\xA6\xA8\xAD\xFB\xB8\xEA\xAE\xC6\n";
+    const auto object = [&](const std::string& name, const std::string& controls, const CObject& of) {
+        return "<meta http-equiv=\"Content-Type\" content=\"text/html; charset=big5\">\n"
+               "<H1>CObject</H1>\n<HR>\n" +
+               caption + "<TR><TH>\xAA\xAB\xA5\xF3\xA6\x57\xBA\xD9</TH><TD>" + name + "</TD></TR>\n" +
+               "<TR><TH>\xB1\xB1\xA8\xEE\xAA\xAB\xA5\xF3</TH><TD>" + controls + "</TD></TR>\n" +
+               "<TR><TH>\xAA\xAB\xA5\xF3ID</TH><TD>" + ID(of) + "</TD></TR>\n</CAPTION></TABLE>\n";
+    };
+    const auto spatial = [&](const std::string& parent, const std::string& matrix, const char* cull) {
+        return "<H1>CSpatial</H1>\n<HR>\n" + caption + "<TR><TH>Parent</TH><TD>" + parent + "</TD></TR>\n" +
+               "<TR><TH>m_kMatrix</TH><TD>" + matrix + "</TD></TR>\n<TR><TH>m_kWorldMatrix</TH><TD>" +
+               kIdentity + "</TD></TR>\n<TR><TH>m_bForceCull</TH><TD>" + cull +
+               "</TD></TR>\n</CAPTION></TABLE>\n";
+    };
+    const CObject& control = *root->GetControl();
+    const std::string toControl = "<BR><A HREF=\".\\OrnHTML" + ID(control) + ".htm\">CKeyframeControl";
+    EXPECT_EQ(PageOf(*root), object("NoName", toControl, *root) +
+                                 spatial("NULL",
+                                         "[(1.000, 0.000, 0.000, 0.000),(0.000, 1.000, 0.000, 0.000),"
+                                         "(0.000, 0.000, 1.000, 0.000),(0.001, -1234.568, 7.000, 1.000)]",
+                                         "true") +
+                                 "<H1>CNode</H1>\n<HR>\n" + caption +
+                                 "<TR><TH>m_kChild</TH><TD><BR><A HREF=\".\\OrnHTML" + ID(*light) +
+                                 ".htm\">CPointLight Lamp</TD></TR>\n</CAPTION></TABLE>\n");
+    EXPECT_EQ(PageOf(*light),
+              object("Lamp", "", *light) +
+                  spatial("<A HREF=\".\\OrnHTML" + ID(*root) + ".htm\">CNode", kIdentity, "false") +
+                  "<H1>CLight</H1>\n<HR>\n" + caption +
+                  "<TR><TH>m_kRGB</TH><TD>(0.000, 0.000, 0.000)</TD></TR>\n"
+                  "<TR><TH>m_fIntensity</TH><TD>INFINITY</TD></TR>\n</CAPTION></TABLE>\n"
+                  "<H1>CPointLight</H1>\n<HR>\n" +
+                  caption +
+                  "<TR><TH>m_kLocation</TH><TD>(1.000, 2.000, 3.000)</TD></TR>\n"
+                  "<TR><TH>m_kWorldLocation</TH><TD>(0.000, 0.000, 0.000)</TD></TR>\n</CAPTION></TABLE>\n");
+    EXPECT_EQ(PageOf(control), object("NoName", "", control)) << "a control has the table of all";
+}
+
+TEST_F(HTMLDump, CustomDataHasNoTableAndAnObjectThatIsNoNodeNoSite)
+{
+    const Ref<CRawData> data = new CRawData;
+    data->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_EQ(FileCount(), 0u);
+    COrnHTMLWriter page;
+    data->DumpHTML(m_kFolder.Path(), page);
+    ASSERT_TRUE(page.SaveAs(m_kFolder.Path("data.htm")));
+    EXPECT_EQ(Page("data.htm"), "");
+}
+
+TEST_F(HTMLDump, SharedObjectsHaveOnePageAndRingsComeToAnEnd)
+{
+    const Ref<CNode> root = Node("root");
+    const Ref<CNode> shared = Node("shared");
+    const Ref<CNode> other = Node("other");
+    for (CNode* child : {shared.Get(), other.Get(), shared.Get()})
+        root->AttachChild(child);
+    other->AttachChild(shared.Get());
+    shared->AttachChild(root.Get());
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_EQ(FileCount(), 5u);
+    const std::string tree = Page("TreeView.htm");
+    const std::string entry = "gFld(\"shared\"";
+    EXPECT_EQ(tree.find(entry), tree.rfind(entry)) << "at the first of its places";
+    shared->DetachChild(root.Get());
+}
+
+TEST_F(HTMLDump, NoTreeIsTooDeep)
+{
+    constexpr int kLevels = 20'000;
+    const Ref<CNode> root = Node("root");
+    std::vector<Ref<CNode>> nodes{root};
+    for (int level = 0; level < kLevels; ++level)
+    {
+        nodes.push_back(new CNode);
+        nodes[nodes.size() - 2]->AttachChild(nodes.back().Get());
+    }
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_EQ(FileCount(), kLevels + 3u);
+    while (nodes.size() > 1) // from below, so that they do not die one within the other
+    {
+        nodes[nodes.size() - 2]->DetachChild(nodes.back().Get());
+        nodes.pop_back();
+    }
+}
+
+TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
+{
+    const Ref<CNode> root = Node("root");
+    const Ref<CNode> child = Node("child");
+    const Ref<CNode> grandchild = Node("grandchild");
+    root->AttachChild(child.Get());
+    child->AttachChild(grandchild.Get());
+    ASSERT_TRUE(CreateFolder(m_kFolder.Path("Index.htm")));
+    ASSERT_TRUE(CreateFolder(m_kFolder.Path(GetHTMLFileName(*child, EHTMLPath::Bare))));
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_THAT(PageOf(*grandchild), HasSubstr("grandchild"));
+    EXPECT_THAT(PageOf(*root), HasSubstr("root"));
+
+    COrnHTMLPage page;
+    EXPECT_FALSE(page.SaveAs(m_kFolder.Path("Index.htm")));
+    EXPECT_TRUE(page.SaveAsText(m_kFolder.Path("page.htm").c_str()));
+    root->WriteHTMLFrames(m_kFolder.Path("no folder/"));
+    EXPECT_FALSE(FolderExists(m_kFolder.Path("no folder")));
+}
+
+TEST_F(HTMLDump, APageIsFollowedByThePagesInIt)
+{
+    COrnHTMLPage inner;
+    inner.AddFormat("%s-%u", std::string(5000, 'x').c_str(), 7u);
+    COrnHTMLWriter page;
+    page.AddLine("100% first");
+    page.AddPage(inner);
+    page.AddLine("second");
+    ASSERT_TRUE(page.SaveAs(m_kFolder.Path("page.htm")));
+    EXPECT_EQ(Page("page.htm"), "100% first\nsecond\n" + std::string(5000, 'x') + "-7\n");
+}
+
+TEST(HTMLText, NamesAreNoMarkupAndNoScript)
+{
+    const struct
+    {
+        const char* what;
+        std::string_view name;
+        std::string_view page;
+        std::string_view script;
+    } rows[] = {
+        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"     },
+        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\\"'"   },
+        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\\\\\\"b\\r\\n"},
+        {"two, three and four bytes of UTF-8",    "\u00fc\u6771\U0001f9b4", "&#252;&#26481;&#129460;",
+         "\\u{fc}\\u{6771}\\u{1f9b4}"                                                                                    },
+        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\xa5\x5c\\\""    },
+        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\x81\\\\\\\""    },
+        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\xa5\\x3c"       },
+        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\xc0\xbc"        },
+        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\xed\xa0\x80"    },
+        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\u6771\xe6\x9d"  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        EXPECT_EQ(HTMLText(row.name), row.page);
+        EXPECT_EQ(HTMLScriptText(row.name), row.script);
+    }
+}
+
+TEST(HTMLText, FloatsWithoutEndAreWords)
+{
+    constexpr float kInfinity = std::numeric_limits<float>::infinity();
+    const float below = std::nextafter(FLT_MAX, 0.0f);
+    const struct
+    {
+        float value;
+        std::string_view text;
+    } rows[] = {
+        {0.0f,       "0.000"                                       },
+        {-1.0005f,   "-1.000"                                      },
+        {FLT_MAX,    "INFINITY"                                    },
+        {-FLT_MAX,   "-INFINITY"                                   },
+        {kInfinity,  "INFINITY"                                    },
+        {-kInfinity, "-INFINITY"                                   },
+        {below,      "340282326356119256160033759537265639424.000" },
+        {-below,     "-340282326356119256160033759537265639424.000"},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(HTMLText(row.value), row.text);
+    EXPECT_EQ(HTMLText(Vec3{kInfinity, 1, -0.0f}), "(inf, 1.000, -0.000)");
+}
+
+TEST(HTMLMarkup, AnchorsGetTheirFolderAndEndingWhereTheyHaveNone)
+{
+    EXPECT_EQ(HTMLAnchor("a", "text"), "<A HREF=\".\\a.htm\">text");
+    EXPECT_EQ(HTMLAnchor("a.html", "text"), "<A HREF=\".\\a.html\">text");
+    EXPECT_EQ(HTMLAnchor("b\\a", "text"), "<A HREF=\"b\\a.htm\">text");
+    EXPECT_EQ(HTMLTable(EHTMLEnd::Opening, 12), "<TABLE BORDER=\"12\"><CAPTION>");
+}
+
+} // namespace gw
