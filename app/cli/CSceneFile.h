@@ -47,12 +47,12 @@ public:
     float TimeOf(int64_t frame);
     /// Brings one root after the other to a time.
     void Update(float time);
+    /// The roots of a container, in their order, or the root of a motion.
+    std::vector<CObject*> Roots() const;
     /// All objects that the roots hold, in save order.
     std::vector<CObject*> Objects();
 
 private:
-    std::vector<CObject*> Roots() const;
-
     bool m_bContainer = false;
     CMotionFile m_kMotion;
     COrrinStream m_kScene;

@@ -42,6 +42,11 @@ constexpr CCommand kCommands[] = {
         "gaitwright transcode walk.htr slow.htr --frame-scale 2"),
     Row("resave", "IN OUT", kForce, 0, RunResave,
         "Read a container and write it again, in the newest version.", "gaitwright resave old.orn new.orn"),
+    Row("dump", "FILE", kOutputFolder, kOutputFolder, RunDump,
+        "Write what a container holds as linked pages, one for each object, with a folding tree.\n"
+        "Open Index.htm of the folder in a browser; further roots have Index2.htm and so on. Pages that are\n"
+        "there are replaced.",
+        "gaitwright dump scene.orn --out-dir pages"),
     Row("extract", "FILE", kOutput | kForce, kOutput, RunExtract,
         "Take the motion file out of a Kinetra file.", "gaitwright extract walk.Kinetra -o walk.htr"),
     Row("package", "IN OUT", kRate | kForce, kRate, RunPackage, "Wrap a motion file into a Kinetra file.",

@@ -64,6 +64,7 @@ EExit RunExtract(const COptions& options);
 EExit RunPackage(const COptions& options);
 EExit RunProfiles(const COptions& options);
 EExit RunCompare(const COptions& options);
+EExit RunDump(const COptions& options);
 EExit RunRender(const COptions& options);
 
 } // namespace gw

@@ -4,7 +4,7 @@ import shlex
 from harness import DONE, FAILED, USAGE, CliTest, main
 
 COMMANDS = ("convert", "batch", "info", "pose", "transcode", "resave", "extract", "package", "profiles", "compare",
-            "render")
+            "render", "dump")
 
 WRONG = [  # what, arguments, words on standard error
     ("no command", "", ["a command is missing", "--help"]),
@@ -23,6 +23,7 @@ WRONG = [  # what, arguments, words on standard error
     ("both of them", "pose a.bvh --frame 1 --time 2", ["one of", "--frame N | --time T"]),
     ("a time that is no number", "pose a.bvh --time now", ['"now"', "no number"]),
     ("a time without end", "pose a.bvh --time inf", ["inf"]),
+    ("a folder is missing", "dump a.orn", ["--out-dir"]),
     ("an option without its value", "pose a.bvh --frame", ["--frame"]),
     ("an option twice", "pose a.bvh --frame 1 --frame 2", ["--frame"]),
     ("a frame that is no integer", "pose a.bvh --frame 1.5", ["1.5"]),

@@ -1,0 +1,10 @@
+#pragma once
+
+#include <string_view>
+
+namespace gw {
+
+/// The text of TreeView.js, which the tree page of an object dump wants beside it.
+extern const std::string_view kTreeViewScript;
+
+} // namespace gw
