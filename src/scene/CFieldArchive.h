@@ -179,10 +179,10 @@ public:
     template <class T>
     void SignedBlock(const char* name, std::vector<T>& values)
     {
-        int32_t count = static_cast<int32_t>(values.size());
-        Signed(name, count);
+        int32_t stored = 0;
         if (IsReading())
-            values.resize(Fitting(count, sizeof(T)));
+            Signed(name, stored);
+        values.resize(IsReading() ? Fitting(stored, sizeof(T)) : Count(name, values.size(), sizeof(T)));
         Values(name, FieldKind<T>(), values.data(), values.size());
     }
     /// A presence word and, where it is not 0, `count` plain values. On reading, a zero word leaves the block
