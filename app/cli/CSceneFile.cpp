@@ -107,12 +107,14 @@ float CSceneFile::TimeOf(int64_t frame)
     return track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
 }
 
+// Not upward: above a root may only be others, which have bounds of their own turn. A chain of thousands of
+// roots, each in the one before, would never end with every one walking all above it.
 void CSceneFile::Update(float time)
 {
     for (CObject* root : Roots())
     {
         if (CSpatial* spatial = RecordCast<CSpatial>(root))
-            spatial->UpdateScene(time, true);
+            spatial->UpdateScene(time, false);
     }
 }
 
