@@ -3,7 +3,7 @@ import json
 import struct
 
 from harness import DONE, FAILED, CliTest, main
-from made import HTR, Container, moved, one_bone_scene, profile
+from made import HTR, IDENTITY, Container, moved, one_bone_scene, profile
 
 
 def skeleton():
@@ -44,6 +44,13 @@ DAMAGED = [  # what, content, words
 ]
 
 
+def roots_in_roots(levels):
+    scene = Container()
+    for number in range(1, levels + 1):
+        scene.node(number, "n%d" % number, children=(number + 1,) if number < levels else (), root=True)
+    return scene.bytes
+
+
 class Containers(CliTest):
     def pose(self, name, frame):
         result = self.run_program("pose", name, "--frame", frame)
@@ -80,6 +87,12 @@ class Containers(CliTest):
         self.assertNotIn("first groups", seam["links"])
 
     def test_a_list_of_one_stays_a_list(self):
+        body = Container.floats(IDENTITY) + struct.pack("<BIi3f", 1, 0, 1, 4, 5, 6) + bytes(41)
+        circle = Container().record("CCircle", 1, "", (0, 0, 0), body + Container.floats([2]), True).bytes
+        self.write("circle.orn", circle)
+        told = json.loads(self.run_program("info", "circle.orn", "--json").out)["objects"][0]["fields"]
+        self.assertEqual((told["XYZBuffer"], told["m_fRadius"]), ([[4, 5, 6]], 2))
+        self.assertNotIn("XYZBuffer[1]", told)
         self.write("scene.orn", one_bone_scene(frames=1))
         track = json.loads(self.run_program("info", "scene.orn", "--json").out)["objects"][1]
         self.assertEqual(track["fields"]["m_kPositionKeys"], [[0, 90, 0]])
@@ -114,7 +127,8 @@ class Containers(CliTest):
         for what, content, words in DAMAGED:
             self.write("bad.orn", content)
             for command in (["resave", "bad.orn", "out.orn"], ["extract", "bad.orn", "-o", "out.htr"],
-                            ["pose", "bad.orn", "--frame", "0"], ["info", "bad.orn", "--json"]):
+                            ["pose", "bad.orn", "--frame", "0"], ["pose", "bad.orn", "--time", "1", "--objects"],
+                            ["dump", "bad.orn", "--out-dir", "pages"], ["info", "bad.orn", "--json"]):
                 with self.subTest(what, command=command[0]):
                     result = self.run_program(*command)
                     self.assertEqual(result.code, FAILED)
@@ -123,6 +137,13 @@ class Containers(CliTest):
                     if command[0] == "info":
                         self.assertEqual(len(json.loads(result.out)["failures"]), 1)
             self.assertEqual(self.with_assets("convert", "bad.orn", "-o", "a.htr").code, FAILED)
+
+    def test_roots_within_roots_are_worked_on_level_by_level(self):
+        self.write("roots.orn", roots_in_roots(3000))
+        for command in (["pose", "roots.orn", "--time", "1", "--objects"], ["info", "roots.orn", "--json"],
+                        ["dump", "roots.orn", "--out-dir", "pages"], ["resave", "roots.orn", "out.orn"]):
+            self.assertEqual(self.run_program(*command).code, DONE)
+        self.assertEqual(self.read("out.orn"), self.read("roots.orn"))
 
     def test_every_beginning_of_a_scene_is_read_or_told_to_be_damaged(self):
         whole = skeleton()
