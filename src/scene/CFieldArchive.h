@@ -9,6 +9,7 @@
 #include "Vec3.h"
 #include "Watch.h"
 
+#include <algorithm>
 #include <cstddef>
 #include <cstdint>
 #include <type_traits>
@@ -172,8 +173,7 @@ public:
     template <class T>
     void Block(const char* name, std::vector<T>& values)
     {
-        values.resize(Count(name, values.size(), sizeof(T)));
-        Values(name, FieldKind<T>(), values.data(), values.size());
+        Elements(name, values, Count(name, values.size(), sizeof(T)));
     }
     /// The same with a signed count, of which those below 0 are none.
     template <class T>
@@ -182,8 +182,8 @@ public:
         int32_t stored = 0;
         if (IsReading())
             Signed(name, stored);
-        values.resize(IsReading() ? Fitting(stored, sizeof(T)) : Count(name, values.size(), sizeof(T)));
-        Values(name, FieldKind<T>(), values.data(), values.size());
+        Elements(name, values,
+                 IsReading() ? Fitting(stored, sizeof(T)) : Count(name, values.size(), sizeof(T)));
     }
     /// A presence word and, where it is not 0, `count` plain values. On reading, a zero word leaves the block
     /// empty whatever the count, and a count below 0 with a block is damage: its length cannot be told.
@@ -193,10 +193,10 @@ public:
         const bool present = Presence(name, !values.empty());
         if (IsReading() && present && count < 0)
             Refuse(EFailure::BadCount);
-        if (IsReading())
-            values.resize(present ? Fitting(count, sizeof(T)) : 0);
         if (present)
-            Values(name, FieldKind<T>(), values.data(), values.size());
+            Elements(name, values, Fitting(count, sizeof(T)));
+        else if (IsReading())
+            values.clear();
     }
 
     /// A count and a list of elements that have fields of their own: fields(archive, element).
@@ -225,6 +225,9 @@ protected:
     virtual void EndElement() {}
 
 private:
+    template <class T>
+    void Elements(const char* name, std::vector<T>& values, size_t count);
+
     CVersion m_kVersion;
     bool m_bReading;
 };
@@ -247,6 +250,24 @@ protected:
 private:
     uint64_t m_uiBytes = 0;
 };
+
+// A vector zeroes what it gains. Piece by piece the zeros are still in the cache when they are overwritten,
+// so that a large block costs what a plain copy does.
+template <class T>
+void CFieldArchive::Elements(const char* name, std::vector<T>& values, size_t count)
+{
+    constexpr size_t kPiece = (size_t{1} << 16) / sizeof(T);
+    if (!IsReading())
+        return Values(name, FieldKind<T>(), values.data(), values.size());
+    values.clear();
+    values.reserve(count);
+    while (values.size() < count)
+    {
+        const size_t start = values.size();
+        values.resize(std::min(count, start + kPiece));
+        Values(name, FieldKind<T>(), values.data() + start, values.size() - start);
+    }
+}
 
 template <class T, class F>
 void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
