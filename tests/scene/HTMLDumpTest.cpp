@@ -92,7 +92,6 @@ TEST_F(HTMLDump, FramesTreeAndPagesAreWrittenAsTold)
     EXPECT_THAT(Page("TreeView.htm"),
                 HasSubstr("<!--\nNode" + ID(*empty) + " = gFld(\"Alone\", \"OrnHTML" + ID(*empty) +
                           ".htm target=mainFrame\");\ninitializeDocument(Node" + ID(*empty) + ")\n-->"));
-    new CCamera; // takes an id, so that the next one is another
 }
 
 TEST_F(HTMLDump, APageHasTheTablesOfAllClassesOfItsObject)
