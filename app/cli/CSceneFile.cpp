@@ -107,15 +107,28 @@ float CSceneFile::TimeOf(int64_t frame)
     return track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
 }
 
-// Not upward: above a root may only be others, which have bounds of their own turn. A chain of thousands of
-// roots, each in the one before, would never end with every one walking all above it.
+// A root may hang in others. Their bounds follow once behind all instead of behind every root: a chain of
+// thousands of roots, each in the one before, would never end with every one measuring all above it.
 void CSceneFile::Update(float time)
 {
+    std::unordered_set<CSpatial*> above;
+    std::vector<CSpatial*> tops;
     for (CObject* root : Roots())
     {
-        if (CSpatial* spatial = RecordCast<CSpatial>(root))
-            spatial->UpdateScene(time, false);
+        CSpatial* spatial = RecordCast<CSpatial>(root);
+        if (!spatial)
+            continue;
+        spatial->UpdateScene(time, false);
+        CSpatial* ancestor = spatial->GetParent();
+        while (ancestor && above.insert(ancestor).second)
+        {
+            if (!ancestor->GetParent())
+                tops.push_back(ancestor);
+            ancestor = ancestor->GetParent();
+        }
     }
+    for (CSpatial* top : tops)
+        top->UpdateBound();
 }
 
 } // namespace gw
