@@ -203,7 +203,7 @@ std::string HTMLText(const Mat4& m)
     std::string text = "[";
     const std::span<const float> values(m.m);
     for (size_t row = 0; row < 4; ++row)
-        text += (row == 0 ? "" : ",") + InBrackets(values.subspan(4 * row, 4));
+        text.append(row == 0 ? "" : ",").append(InBrackets(values.subspan(4 * row, 4)));
     return text + ']';
 }
 
