@@ -73,8 +73,8 @@ void CFieldRows::Values(const char* name, EFieldKind kind, void* values, size_t 
     const auto* value = static_cast<const std::byte*>(values);
     std::string text;
     for (size_t i = 0; i < std::min(count, kShownValues); ++i)
-        text.append(i == 0 ? "" : " ").append(
-            kTextOf[static_cast<size_t>(kind)](value + i * FieldBytes(kind)));
+        text.append(i == 0 ? "" : " ")
+            .append(kTextOf[static_cast<size_t>(kind)](value + i * FieldBytes(kind)));
     Show(name, text + LengthText(count));
 }
 
