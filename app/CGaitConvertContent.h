@@ -29,6 +29,13 @@ inline constexpr Vec3 kRootPosition{0.0f, 923.0f, 13.0f};
 /// The playbar's last value; the whole motion lies between 0 and this.
 inline constexpr int kScrollRange = 256;
 
+/// What a conversion does beside the rules; all off unless chosen.
+struct ConversionChoices
+{
+    bool align = false;    ///< the source is told from a rest pose that suits the rules
+    bool faithful = false; ///< hips, knees and feet keep to the source
+};
+
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
 /// when they failed and 1 otherwise, also when a dialog was cancelled.
@@ -59,6 +66,9 @@ public:
     int RunBatch();
     /// The same, with the dialog beginning in a folder; an empty one means that of the last source.
     int RunBatch(const std::string& folder);
+    /// What conversions from now on do beside the rules.
+    void SetChoices(const ConversionChoices& choices) { m_kChoices = choices; }
+    const ConversionChoices& Choices() const { return m_kChoices; }
     /// The result, written and packaged as the path's extension says. Replaces what is there. False when
     /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
     /// reported.
@@ -206,10 +216,11 @@ private:
     std::string m_kMaxProfileName;
     std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                     ///< what SetTitle was given last
-    bool m_bConverted = false;                ///< a conversion has been made for the open source
-    bool m_bSaved = true;                     ///< the result has been saved, or there was none
-    CBoneMapProfile* m_pkProfile = nullptr;   ///< the editor's
-    CFailureRecord m_kWriteRecord;            ///< what the last WriteResult failed on
+    ConversionChoices m_kChoices;
+    bool m_bConverted = false;              ///< a conversion has been made for the open source
+    bool m_bSaved = true;                   ///< the result has been saved, or there was none
+    CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's
+    CFailureRecord m_kWriteRecord;          ///< what the last WriteResult failed on
 };
 
 } // namespace gw

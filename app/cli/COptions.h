@@ -33,10 +33,12 @@ struct COptions
     std::string profile;      ///< a display name, or the path of a .prf file
     std::string dataFolder;   ///< replaces the folder beside the executable; empty for that
     std::string job;          ///< htr or orn
+    std::string html;         ///< --html, the page to write; empty for none
+    std::string fix;          ///< --fix, the mended copy to write; empty for none
     int64_t frame = 0;
     std::optional<float> time; ///< --time, in place of a frame; in the unit of the file's controls
-    std::string with;  ///< the motion to draw beside the first one; empty for none
-    int64_t strip = 1; ///< number of poses
+    std::string with;          ///< the motion to draw beside the first one; empty for none
+    int64_t strip = 1;         ///< number of poses
     CPixelSize size;
     float rate = 0.0f;       ///< frames per second
     float frameScale = 1.0f; ///< factor for the number of frames
@@ -48,6 +50,9 @@ struct COptions
     bool dryRun = false;       ///< say what would be done
     bool noLegs = false;       ///< leave the feet to the plain rotation transfer
     bool keepGoing = false;    ///< go on behind a source that failed
+    bool align = false;        ///< tell the source from a rest pose that suits the rules first
+    bool faithful = false;     ///< let hips, knees and feet keep to the source
+    bool check = false;        ///< measure each result
     bool objects = false;      ///< tell all spatial objects, not nodes alone
 };
 

@@ -31,6 +31,11 @@ enum EOption : uint32_t
     kSize = 1u << 17,
     kTime = 1u << 18,
     kObjects = 1u << 19,
+    kAlign = 1u << 20,
+    kFaithful = 1u << 21,
+    kCheck = 1u << 22,
+    kHtml = 1u << 23,
+    kFix = 1u << 24,
 };
 
 /// One command of the program.

@@ -1,0 +1,67 @@
+#pragma once
+
+#include <array>
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+namespace gw {
+
+class CNode;
+class CRetargeter;
+
+/// The side of the body, by its own right and left.
+enum class EBodySide : uint8_t
+{
+    Left,
+    Right,
+};
+inline constexpr std::array kBodySides{EBodySide::Left, EBodySide::Right};
+
+/// The joints of one arm; each turns the bone below it. Null for one that the skeleton does not have.
+struct BodyArm
+{
+    CNode* clavicle = nullptr;
+    CNode* upperArm = nullptr;
+    CNode* forearm = nullptr;
+    CNode* hand = nullptr;
+};
+
+/// The joints of one leg; each turns the bone below it. Null for one that the skeleton does not have.
+struct BodyLeg
+{
+    CNode* thigh = nullptr;
+    CNode* shin = nullptr;
+    CNode* foot = nullptr; ///< the ankle
+    CNode* toe = nullptr;  ///< the ball of the foot
+};
+
+/// Which joints of a skeleton are those of a human body. The nodes are looked at and not kept alive.
+struct CBodyMap
+{
+    CNode* hip = nullptr;      ///< the joint that carries the body's motion, where legs and spine part
+    std::vector<CNode*> spine; ///< from the pelvis upward, without hip and neck
+    std::vector<CNode*> neck;  ///< upward, without the head
+    CNode* head = nullptr;
+    std::array<BodyArm, 2> arms; ///< by EBodySide
+    std::array<BodyLeg, 2> legs;
+
+    BodyArm& Arm(EBodySide side) { return arms[static_cast<size_t>(side)]; }
+    const BodyArm& Arm(EBodySide side) const { return arms[static_cast<size_t>(side)]; }
+    BodyLeg& Leg(EBodySide side) { return legs[static_cast<size_t>(side)]; }
+    const BodyLeg& Leg(EBodySide side) const { return legs[static_cast<size_t>(side)]; }
+
+    /// The thirteen joints that drive a whole body are there: hip, a spine joint, head, and on each side
+    /// upper arm, forearm, hand, thigh and shin.
+    bool DrivesBody() const;
+    /// And the two feet besides, without which none can be planted.
+    bool HasFeet() const;
+};
+
+/// The body that the rows of a retargeter's table tell of a source skeleton: what drives the target's bones,
+/// with the joints between hip, neck and head as the source's tree has them. A toe is the only child joint of
+/// a foot where no row names it. A torso bone that is driven from outside the spine (a collar) names no
+/// joint.
+CBodyMap BodyOfTable(const CRetargeter& table, CNode& targetRoot);
+
+} // namespace gw
