@@ -67,7 +67,7 @@ public:
     /// The same, with the dialog beginning in a folder; an empty one means that of the last source.
     int RunBatch(const std::string& folder);
     /// What conversions from now on do beside the rules.
-    void SetChoices(const ConversionChoices& choices) { m_kChoices = choices; }
+    void SetChoices(const ConversionChoices& choices);
     const ConversionChoices& Choices() const { return m_kChoices; }
     /// The result, written and packaged as the path's extension says. Replaces what is there. False when
     /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
@@ -175,6 +175,7 @@ private:
     uint32_t ControlFacts() const;
     uint32_t ProfileFacts() const;
     void ShowHighlights();
+    void ShowChoices();
 
     // Commands.cpp
     void ForViews(void (CMotionView::*operation)());

@@ -145,6 +145,23 @@ void CGaitConvertContent::UpdateControls()
     m_kWindow.SetChildScrollValue("|playbar", ScrollValue(Clock(m_pkSourceView.get())));
     m_kWindow.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
     ShowHighlights();
+    ShowChoices();
+}
+
+void CGaitConvertContent::SetChoices(const ConversionChoices& choices)
+{
+    m_kChoices = choices;
+    UpdateControls();
+}
+
+// What is on can be seen without opening the menu.
+void CGaitConvertContent::ShowChoices()
+{
+    std::string text = m_kChoices.align ? "aligned" : "";
+    if (m_kChoices.faithful)
+        text += text.empty() ? "faithful" : ", faithful";
+    m_kWindow.SetChildFace("options", text.empty() ? 0 : 1);
+    m_kWindow.SetChildText("#choices", text);
 }
 
 void CGaitConvertContent::ShowHighlights()

@@ -3,6 +3,7 @@
 #include "QtText.h"
 
 #include <QApplication>
+#include <QLabel>
 #include <QMenu>
 #include <QMouseEvent>
 #include <QSlider>
@@ -223,6 +224,31 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("Invalid BVH file format.")});
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("broken.bvh:2:"));
     EXPECT_TRUE(person.IsOn("convert")) << "the source before stays";
+}
+
+TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
+{
+    CPerson person;
+    const auto choose = [&](int row) {
+        person.Click("options");
+        ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
+        auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
+        QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
+                          menu->actionGeometry(menu->actions()[row]).center());
+        ASSERT_TRUE(person.WaitUntil([] { return !QApplication::activePopupWidget(); }));
+    };
+    const auto shown = [&] { return static_cast<QLabel*>(person.Child("#choices"))->text(); };
+    EXPECT_EQ(shown(), QString());
+    choose(1);
+    EXPECT_TRUE(person.Content().Choices().faithful);
+    EXPECT_FALSE(person.Content().Choices().align);
+    EXPECT_EQ(shown(), QStringLiteral("faithful"));
+    choose(0);
+    EXPECT_EQ(shown(), QStringLiteral("aligned, faithful"));
+    choose(1);
+    EXPECT_EQ(shown(), QStringLiteral("aligned"));
+    person.Restart();
+    EXPECT_EQ(shown(), QString());
 }
 
 TEST(MainWindow, ASecondClickOnTheCornerCloses)

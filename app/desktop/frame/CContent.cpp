@@ -79,6 +79,8 @@ void CContent::Click(const std::string& child)
 {
     if (child == "minimise")
         window()->showMinimized();
+    else if (child == "options")
+        m_kOptions(Child<QWidget>(child)->mapToGlobal(QPoint(0, 0)));
     else if (child == "notes")
         ShowMessageBox(0, ToUtf8(QCoreApplication::translate("Face", "Notes on the last step")),
                        EButtons::OK);

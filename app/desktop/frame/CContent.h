@@ -40,6 +40,8 @@ public:
     std::function<void(const QPoint& globalPosition)> m_kTitleDown;
     /// The mouse went down in the icon's corner.
     std::function<void(const QPoint& globalPosition)> m_kCornerDown;
+    /// The options were asked for; the place is where their menu opens.
+    std::function<void(const QPoint& globalPosition)> m_kOptions;
 
     EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
     std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;

@@ -6,6 +6,7 @@
 #include "CProfileEditorWindow.h"
 #include "CSkin.h"
 #include "CornerMenu.h"
+#include "OptionsMenu.h"
 #include "QtText.h"
 #include "StringTable.h"
 #include "WindowPlace.h"
@@ -71,6 +72,10 @@ CGaitConvertFrame::CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, C
     m_pkFace->SetLogic(m_spContent.get());
     m_pkFace->m_kTitleDown = [this](const QPoint& position) { BeginMove(position); };
     m_pkFace->m_kCornerDown = [this](const QPoint& position) { OpenCornerMenu(position); };
+    m_pkFace->m_kOptions = [this](const QPoint& place) {
+        QMenu* const menu = MakeOptionsMenu(*m_spContent, this);
+        menu->popup(place - QPoint(0, menu->sizeHint().height()));
+    };
     m_spContent->OnInitContent();
     m_spContent->SetTitle({});
     m_pkEditor = new CProfileEditorWindow(*m_spContent, platform, this);

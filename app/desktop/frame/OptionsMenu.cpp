@@ -1,0 +1,56 @@
+#include "OptionsMenu.h"
+
+#include "CGaitConvertContent.h"
+
+#include <QCoreApplication>
+
+namespace gw {
+
+namespace {
+
+struct Choice
+{
+    const char* text;
+    const char* tip;
+    bool ConversionChoices::*chosen;
+};
+
+constexpr Choice kChoices[] = {
+    {QT_TRANSLATE_NOOP("OptionsMenu", "Align the rest pose"),
+     QT_TRANSLATE_NOOP("OptionsMenu",
+     "Tells the source from a T-pose first: for A-poses, arms that hang, bone "
+                       "frames that stand turned and joints whose positions repeat"),
+     &ConversionChoices::align   },
+    {QT_TRANSLATE_NOOP("OptionsMenu", "Faithful hips, knees and feet"),
+     QT_TRANSLATE_NOOP("OptionsMenu",
+     "Hips stand and travel as the source's do, knees bend in its planes, feet "
+                       "turn as its feet and stand still where they stand"),
+     &ConversionChoices::faithful},
+};
+
+void AddChoice(QMenu& menu, CGaitConvertContent& logic, const Choice& choice)
+{
+    QAction* const action = menu.addAction(QCoreApplication::translate("OptionsMenu", choice.text));
+    action->setToolTip(QCoreApplication::translate("OptionsMenu", choice.tip));
+    action->setCheckable(true);
+    action->setChecked(logic.Choices().*choice.chosen);
+    QObject::connect(action, &QAction::triggered, &menu, [&logic, chosen = choice.chosen](bool on) {
+        ConversionChoices choices = logic.Choices();
+        choices.*chosen = on;
+        logic.SetChoices(choices);
+    });
+}
+
+} // namespace
+
+QMenu* MakeOptionsMenu(CGaitConvertContent& logic, QWidget* owner)
+{
+    auto* const menu = new QMenu(owner);
+    menu->setAttribute(Qt::WA_DeleteOnClose);
+    menu->setToolTipsVisible(true);
+    for (const Choice& choice : kChoices)
+        AddChoice(*menu, logic, choice);
+    return menu;
+}
+
+} // namespace gw
