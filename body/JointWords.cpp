@@ -1,0 +1,310 @@
+// A joint's name is cut into words of a small lexicon. Each word is a set of features ("calf" is lower and
+// leg, as "LoLeg" is), the name is the union of its words' features, and a table tells which unions name a
+// joint. What is not in the lexicon makes the whole name unknown: so twist bones, end joints, fingers and
+// faces need no list.
+
+#include "JointWords.h"
+
+#include "Numbers.h"
+#include "Text.h"
+
+#include <string>
+#include <vector>
+
+namespace gw {
+
+namespace {
+
+enum EFeature : uint32_t
+{
+    kNothing = 0,
+    kLeft = 1u << 0,
+    kRight = 1u << 1,
+    kUp = 1u << 2,
+    kLow = 1u << 3,
+    kMid = 1u << 4,
+    kFore = 1u << 5,
+    kBase = 1u << 6,
+    kCenter = 1u << 7,
+    kJoint = 1u << 8,
+    kHip = 1u << 9,
+    kPelvis = 1u << 10,
+    kSpine = 1u << 11,
+    kTorso = 1u << 12,
+    kNeck = 1u << 13,
+    kHead = 1u << 14,
+    kEndSite = 1u << 15,
+    kClavicle = 1u << 16,
+    kShoulder = 1u << 17,
+    kArm = 1u << 18,
+    kWrist = 1u << 19,
+    kHand = 1u << 20,
+    kLeg = 1u << 21,
+    kAnkle = 1u << 22,
+    kFoot = 1u << 23,
+    kToe = 1u << 24,
+};
+
+struct Word
+{
+    std::string_view text;
+    uint32_t features;
+};
+
+constexpr Word kLexicon[] = {
+    {"left",     kLeft       },
+    {"lft",      kLeft       },
+    {"right",    kRight      },
+    {"rgt",      kRight      },
+    {"up",       kUp         },
+    {"upper",    kUp         },
+    {"lo",       kLow        },
+    {"low",      kLow        },
+    {"lower",    kLow        },
+    {"mid",      kMid        },
+    {"middle",   kMid        },
+    {"fore",     kFore       },
+    {"base",     kBase       },
+    {"center",   kCenter     },
+    {"centre",   kCenter     },
+    {"joint",    kJoint      },
+    {"jnt",      kJoint      },
+    {"bone",     kNothing    },
+    {"bend",     kNothing    }, // the half of a limb's bone that does not twist
+    {"to",       kNothing    },
+    {"hip",      kHip        },
+    {"hips",     kHip        },
+    {"pelvis",   kPelvis     },
+    {"spine",    kSpine      },
+    {"back",     kSpine      },
+    {"chest",    kSpine      },
+    {"thorax",   kSpine      },
+    {"rib",      kSpine      },
+    {"ribs",     kSpine      },
+    {"ribcage",  kSpine      },
+    {"abdomen",  kSpine      },
+    {"ab",       kSpine      },
+    {"navel",    kSpine      },
+    {"waist",    kSpine      },
+    {"torso",    kTorso      },
+    {"neck",     kNeck       },
+    {"atlas",    kNeck       },
+    {"head",     kHead       },
+    {"endsite",  kEndSite    },
+    {"clavicle", kClavicle   },
+    {"clav",     kClavicle   },
+    {"collar",   kClavicle   },
+    {"shoulder", kShoulder   },
+    {"shldr",    kShoulder   },
+    {"arm",      kArm        },
+    {"uarm",     kUp | kArm  },
+    {"humerus",  kUp | kArm  },
+    {"farm",     kFore | kArm},
+    {"elbow",    kFore | kArm},
+    {"radius",   kFore | kArm},
+    {"wrist",    kWrist      },
+    {"hand",     kHand       },
+    {"leg",      kLeg        },
+    {"thigh",    kUp | kLeg  },
+    {"femur",    kUp | kLeg  },
+    {"knee",     kLow | kLeg },
+    {"shin",     kLow | kLeg },
+    {"calf",     kLow | kLeg },
+    {"tibia",    kLow | kLeg },
+    {"ankle",    kAnkle      },
+    {"foot",     kFoot       },
+    {"toe",      kToe        },
+    {"toes",     kToe        },
+    {"ball",     kToe        },
+    {"bale",     kToe        }, // the ball, misspelt in a rig that is about
+};
+
+constexpr uint32_t kSides = kLeft | kRight;
+constexpr uint32_t kLevels = kUp | kLow | kMid;
+
+// A set of features names a joint when it has all that are needed and no more than may be there.
+struct Meaning
+{
+    uint32_t needed;
+    uint32_t allowed; // beside those needed
+    EJointWord word;
+};
+
+constexpr Meaning kMiddleMeanings[] = {
+    {kHip,                kPelvis | kCenter | kBase,              EJointWord::Hip    },
+    {kPelvis,             kCenter | kBase,                        EJointWord::Hip    },
+    {kSpine | kBase,      kNothing,                               EJointWord::HipBase},
+    {kTorso | kLow,       kNothing,                               EJointWord::HipBase},
+    {kSpine,              kLevels | kTorso | kShoulder | kCenter, EJointWord::Spine  },
+    {kTorso,              kLevels | kCenter,                      EJointWord::Spine  },
+    {kShoulder | kCenter, kNothing,                               EJointWord::Spine  },
+    {kNeck,               kLevels | kBase,                        EJointWord::Neck   },
+    {kHead,               kNothing,                               EJointWord::Head   },
+    {kHead | kEndSite,    kNothing,                               EJointWord::HeadEnd},
+};
+
+constexpr Meaning kSideMeanings[] = {
+    {kClavicle,     kNothing, EJointWord::Clavicle},
+    {kShoulder,     kNothing, EJointWord::Shoulder},
+    {kUp | kArm,    kNothing, EJointWord::UpperArm},
+    {kArm,          kNothing, EJointWord::Arm     },
+    {kFore | kArm,  kNothing, EJointWord::Forearm },
+    {kLow | kArm,   kNothing, EJointWord::Forearm },
+    {kWrist,        kNothing, EJointWord::Wrist   },
+    {kHand,         kNothing, EJointWord::Hand    },
+    {kHip,          kNothing, EJointWord::SideHip },
+    {kUp | kLeg,    kNothing, EJointWord::Thigh   },
+    {kLeg,          kNothing, EJointWord::Leg     },
+    {kLow | kLeg,   kNothing, EJointWord::Shin    },
+    {kAnkle,        kNothing, EJointWord::Ankle   },
+    {kFoot,         kNothing, EJointWord::Foot    },
+    {kToe,          kBase,    EJointWord::Toe     },
+    {kFore | kFoot, kNothing, EJointWord::Toe     },
+};
+
+constexpr size_t kLongestToken = 48; // longer than any joint's words in a row
+
+// The features of a run of letters that consists of the lexicon's words alone, as few as can be, so that
+// "upperarm" is not "up", "per" and "arm". Nothing where it does not.
+std::optional<uint32_t> Features(std::string_view token)
+{
+    if (token.size() > kLongestToken)
+        return {};
+    struct Part
+    {
+        size_t words;
+        uint32_t features;
+    };
+    std::vector<std::optional<Part>> parts(token.size() + 1); // of the first so many letters
+    parts[0] = Part{0, kNothing};
+    for (size_t begin = 0; begin < token.size(); ++begin)
+    {
+        if (!parts[begin])
+            continue;
+        for (const Word& word : kLexicon)
+        {
+            if (!token.substr(begin).starts_with(word.text))
+                continue;
+            std::optional<Part>& part = parts[begin + word.text.size()];
+            const Part longer{parts[begin]->words + 1, parts[begin]->features | word.features};
+            if (!part || longer.words < part->words)
+                part = longer;
+        }
+    }
+    return parts.back() ? std::optional(parts.back()->features) : std::nullopt;
+}
+
+uint32_t SideLetter(char letter)
+{
+    return letter == 'l' ? kLeft : letter == 'r' ? kRight : kNothing;
+}
+
+std::optional<uint32_t> With(std::optional<uint32_t> features, uint32_t more)
+{
+    return features && more ? std::optional(*features | more) : std::nullopt;
+}
+
+// The same for a token that may have the letter of a side stuck to it, or be it.
+std::optional<uint32_t> TokenFeatures(std::string_view token)
+{
+    if (token == "c")
+        return kNothing; // the letter of the middle, beside L and R
+    if (const auto whole = Features(token))
+        return whole;
+    if (const auto front = With(Features(token.substr(1)), SideLetter(token.front())))
+        return front;
+    return With(Features(token.substr(0, token.size() - 1)), SideLetter(token.back()));
+}
+
+bool IsDigit(char c)
+{
+    return c >= '0' && c <= '9';
+}
+
+bool IsLetter(char c)
+{
+    return (c >= 'a' && c <= 'z') || (c & 0x80) != 0; // foreign letters are letters of unknown words
+}
+
+template <class Is>
+std::string_view TakeWhile(std::string_view& rest, Is is)
+{
+    size_t length = 0;
+    while (length < rest.size() && is(rest[length]))
+        ++length;
+    const std::string_view taken = rest.substr(0, length);
+    rest.remove_prefix(length);
+    return taken;
+}
+
+// A name as the features of its words. Nothing where a word is unknown or two numbers make it one of many.
+std::optional<uint32_t> NameFeatures(std::string_view rest, int& number)
+{
+    uint32_t features = kNothing;
+    while (!rest.empty())
+    {
+        if (const std::string_view digits = TakeWhile(rest, IsDigit); !digits.empty())
+        {
+            if (number >= 0)
+                return {};
+            number = ParseInt(digits);
+        }
+        else if (const std::string_view letters = TakeWhile(rest, IsLetter); !letters.empty())
+        {
+            const std::optional<uint32_t> more = TokenFeatures(letters);
+            if (!more)
+                return {};
+            features |= *more;
+        }
+        else
+            rest.remove_prefix(1);
+    }
+    return features;
+}
+
+template <size_t count>
+EJointWord WordOf(uint32_t features, const Meaning (&meanings)[count])
+{
+    for (const Meaning& meaning : meanings)
+    {
+        if ((features & meaning.needed) == meaning.needed &&
+            (features & ~(meaning.needed | meaning.allowed)) == 0)
+            return meaning.word;
+    }
+    return EJointWord::None;
+}
+
+// "L5", "T12", "C7": vertebrae of the lumbar spine, the thorax and the neck.
+EJointWord VertebraOf(std::string_view name)
+{
+    constexpr size_t kMostDigits = 2;
+    std::string_view digits = name.substr(std::min<size_t>(name.size(), 1));
+    if (digits.empty() || digits.size() > kMostDigits || TakeWhile(digits, IsDigit).empty() ||
+        !digits.empty())
+        return EJointWord::None;
+    if (name.front() == 'c')
+        return EJointWord::Neck;
+    return name.front() == 'l' || name.front() == 't' ? EJointWord::Spine : EJointWord::None;
+}
+
+} // namespace
+
+JointName ReadJointName(std::string_view name)
+{
+    const std::string lower = LowerCase(name);
+    JointName joint;
+    joint.word = VertebraOf(lower);
+    if (joint.word != EJointWord::None)
+        return joint;
+    const std::optional<uint32_t> features = NameFeatures(lower, joint.number);
+    if (!features || (*features & kSides) == kSides)
+        return {};
+    const uint32_t side = *features & kSides;
+    const uint32_t words = *features & ~(kSides | kJoint);
+    joint.word = side ? WordOf(words, kSideMeanings) : WordOf(words, kMiddleMeanings);
+    joint.side = side == kLeft ? ENameSide::Left : side == kRight ? ENameSide::Right : ENameSide::None;
+    joint.helper = (*features & kJoint) || lower.front() == '_';
+    return joint;
+}
+
+} // namespace gw
