@@ -6,8 +6,6 @@
 
 namespace gw {
 
-namespace {
-
 const Mat4& RestLocal(const CNode& node)
 {
     for (CControl* control = node.GetControl(); control; control = control->GetNext())
@@ -18,8 +16,6 @@ const Mat4& RestLocal(const CNode& node)
     }
     return node.m_kMatrix;
 }
-
-} // namespace
 
 bool IsFrameTime(float frequency)
 {

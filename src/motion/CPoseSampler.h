@@ -28,6 +28,8 @@ private:
     std::unordered_set<const CNode*> m_kWatched;
 };
 
+/// The matrix that a node has in the rest pose, relative to its parent.
+const Mat4& RestLocal(const CNode& node);
 /// The world matrix of a node in the rest pose of its tree, which need not be posed so.
 Mat4 RestWorld(const CNode& node);
 

@@ -1,0 +1,159 @@
+#include "BodySides.h"
+
+#include "CBodyMap.h"
+#include "CJointTree.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+using Leg = LegsOfBody::Leg;
+
+// A foot that goes on along the shin says nothing of where the body looks, nor does a straight knee.
+constexpr double kFootLeast = 0.25; // sine of the angle from the shin to the foot
+constexpr double kKneeLeast = 0.05; // sine of the knee's angle
+constexpr double kKneeSure = 0.35;
+constexpr double kSureAtRest =
+    0.8; // of 2: both feet, as far as they point square to the line between the thighs
+// What the two say weighs differently: a knee is never bent the other way, but may turn outward.
+constexpr float kKneeWeight = 0.7f;
+
+// The part of a vector that is square to a unit axis.
+Vec3 Square(const Vec3& v, const Vec3& axis)
+{
+    return v - axis * static_cast<float>(Vec3Dot(v, axis));
+}
+
+class CPose
+{
+public:
+    CPose(const CJointTree& tree, size_t stance) : m_kTree(tree), m_uiStance(stance) {}
+
+    const Vec3& Place(int joint) const { return m_kTree.Stances().Place(m_uiStance, joint); }
+    Vec3 Direction(int from, int to) const { return Vec3Normalized(Place(to) - Place(from)); }
+    Vec3 Up(const LegsOfBody& body) const { return Direction(body.hip, body.chest); }
+    Vec3 Sideways(const LegsOfBody& body) const { return Direction(body.legs[1].thigh, body.legs[0].thigh); }
+
+    // Where a foot points beside its shin; zero where it says nothing.
+    Vec3 FootForward(const Leg& leg) const
+    {
+        if (leg.ankle < 0)
+            return kVec3Zero;
+        const Vec3& end = m_kTree.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
+        const Vec3 part = Square(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
+        return Vec3Length(part) > kFootLeast ? Vec3Normalized(part) : kVec3Zero;
+    }
+    // Where a knee goes when it bends, longer for a greater bend up to 1.
+    Vec3 KneeForward(const Leg& leg) const
+    {
+        const Vec3 ankle = leg.ankle >= 0 ? Place(leg.ankle) : m_kTree.Stances().Tip(m_uiStance, leg.knee);
+        const Vec3 line = Vec3Normalized(ankle - Place(leg.thigh));
+        const Vec3 part = Square(Direction(leg.thigh, leg.knee), line);
+        const double sine = Vec3Length(part);
+        if (sine < kKneeLeast)
+            return kVec3Zero;
+        return Vec3Normalized(part) * (kKneeWeight * static_cast<float>(std::min(1.0, sine / kKneeSure)));
+    }
+    Vec3 FeetForward(const LegsOfBody& body) const
+    {
+        return FootForward(body.legs[0]) + FootForward(body.legs[1]);
+    }
+    Vec3 KneesForward(const LegsOfBody& body) const
+    {
+        return KneeForward(body.legs[0]) + KneeForward(body.legs[1]);
+    }
+
+private:
+    const CJointTree& m_kTree;
+    size_t m_uiStance;
+};
+
+// The mean of what the poses say; poses that say nothing do not count.
+template <class Say>
+double MeanOfPoses(const CJointTree& tree, const Say& say)
+{
+    double sum = 0.0;
+    double weight = 0.0;
+    for (size_t stance = 0; stance < tree.Stances().Count(); ++stance)
+    {
+        const double said = say(CPose(tree, stance));
+        sum += said;
+        weight += std::fabs(said);
+    }
+    return weight > 0.0 ? sum / weight : 0.0;
+}
+
+bool IsWhole(const LegsOfBody& body)
+{
+    return body.hip >= 0 && body.chest >= 0 &&
+           std::ranges::all_of(body.legs, [](const Leg& leg) { return leg.thigh >= 0 && leg.knee >= 0; });
+}
+
+} // namespace
+
+LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body)
+{
+    LegsOfBody legs{
+        tree.IndexOf(body.hip), tree.IndexOf(body.spine.empty() ? body.head : body.spine.back()), {}};
+    // A spine of one joint at the hip's place points nowhere.
+    if (body.head)
+        legs.chest = tree.IndexOf(body.head);
+    for (const EBodySide side : kBodySides)
+    {
+        const BodyLeg& leg = body.Leg(side);
+        legs.legs[static_cast<size_t>(side)] = {tree.IndexOf(leg.thigh), tree.IndexOf(leg.shin),
+                                                tree.IndexOf(leg.foot), tree.IndexOf(leg.toe)};
+    }
+    return legs;
+}
+
+double JudgeSides(const CJointTree& tree, const LegsOfBody& body)
+{
+    if (!IsWhole(body))
+        return 0.0;
+    const auto leftward = [&](const CPose& pose, const Vec3& forward) {
+        return Vec3Dot(Vec3Cross(pose.Up(body), forward), pose.Sideways(body));
+    };
+    const auto byFeet = [&](const CPose& pose) { return leftward(pose, pose.FeetForward(body)); };
+    const auto byKnees = [&](const CPose& pose) { return leftward(pose, pose.KneesForward(body)); };
+    // Nobody twists the hips in a rest pose that is a stance.
+    const double atRest = IsStance(tree, 0, body) ? byFeet(CPose(tree, 0)) : 0.0;
+    if (std::fabs(atRest) > kSureAtRest)
+        return std::copysign(1.0, atRest);
+    const double feet = MeanOfPoses(tree, byFeet);
+    return feet != 0.0 ? feet : MeanOfPoses(tree, byKnees);
+}
+
+double JudgeAlong(const CJointTree& tree, const LegsOfBody& body, int first, int second)
+{
+    if (!IsWhole(body) || first < 0 || second < 0)
+        return 0.0;
+    return MeanOfPoses(
+        tree, [&](const CPose& pose) { return Vec3Dot(pose.Direction(second, first), pose.Sideways(body)); });
+}
+
+bool IsStance(const CJointTree& tree, size_t stance, const LegsOfBody& body)
+{
+    constexpr double kAway = -0.7;  // cosine of the angle between leg and trunk: 45 degrees from straight
+    constexpr double kBeside = 0.8; // and between the legs
+    if (!IsWhole(body))
+        return false;
+    const CPose pose(tree, stance);
+    const Vec3 left = pose.Direction(body.legs[0].thigh, body.legs[0].knee);
+    const Vec3 right = pose.Direction(body.legs[1].thigh, body.legs[1].knee);
+    const Vec3 up = pose.Up(body);
+    return Vec3Dot(left, up) < kAway && Vec3Dot(right, up) < kAway && Vec3Dot(left, right) > kBeside;
+}
+
+BodyAxes AxesOf(const CJointTree& tree, size_t stance, const LegsOfBody& body)
+{
+    const CPose pose(tree, stance);
+    const Vec3 up = pose.Up(body);
+    const Vec3 left = Vec3Normalized(Square(pose.Sideways(body), up));
+    return {up, Vec3Cross(left, up), left};
+}
+
+} // namespace gw

@@ -1,0 +1,53 @@
+#pragma once
+
+#include "Vec3.h"
+
+#include <cstddef>
+#include <unordered_map>
+#include <vector>
+
+namespace gw {
+
+class CNode;
+
+/// Where all joints of a skeleton are in its rest pose and in some frames spread over its motion. Many files
+/// have rest poses in which nobody could stand, so that what a body looks like is judged over several poses.
+/// The tree is posed meanwhile and left as it was.
+class CStances
+{
+public:
+    explicit CStances(CNode& root);
+
+    /// The joints, depth first.
+    const std::vector<CNode*>& Joints() const { return m_kJoints; }
+    /// The index of a joint; -1 for null and for one of another tree.
+    int IndexOf(const CNode* joint) const;
+
+    /// The number of poses. The first one is the rest pose.
+    size_t Count() const { return m_kPlaces.size(); }
+    /// The place of a joint in a pose, world space.
+    const Vec3& Place(size_t stance, int joint) const
+    {
+        return m_kPlaces[stance][static_cast<size_t>(joint)];
+    }
+    /// Where the bone of an end joint ends; the joint's own place where that is not known.
+    const Vec3& Tip(size_t stance, int joint) const { return m_kTips[stance][static_cast<size_t>(joint)]; }
+
+private:
+    using Places = std::vector<Vec3>;
+
+    void AddRestPose();
+    void AddFrames();
+
+    std::vector<CNode*> m_kJoints;
+    std::unordered_map<const CNode*, int> m_kIndex;
+    Places m_kLocalTips; // in the joint's space
+    std::vector<Places> m_kPlaces;
+    std::vector<Places> m_kTips;
+};
+
+/// Where the bone of a node without node children ends, in the node's space; the origin where that is not
+/// known. A direction that has no sideways part is known in its signs only and lies at 45 degrees then.
+Vec3 BoneTip(const CNode& node);
+
+} // namespace gw

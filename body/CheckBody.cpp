@@ -1,0 +1,231 @@
+#include "CheckBody.h"
+
+#include "BodySides.h"
+#include "BodyTree.h"
+#include "CJointTree.h"
+#include "CNode.h"
+#include "FitLimb.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr double kSidesSure = 0.3;    // of JudgeSides and JudgeAlong
+constexpr double kBetterChoice = 0.4; // by how much another choice must suit a limb better
+constexpr double kUneven = 1.5;       // left bone by right bone
+
+// What carries a joint: the first of these that the body has.
+struct Carrier
+{
+    EBodyJoint joint;
+    EBodyJoint carriers[4];
+};
+using enum EBodyJoint;
+constexpr Carrier kCarriers[] = {
+    {Spine,    {Hip, Hip, Hip, Hip}              },
+    {Neck,     {Spine, Hip, Hip, Hip}            },
+    {Head,     {Neck, Spine, Hip, Hip}           },
+    {Clavicle, {Hip, Hip, Hip, Hip}              },
+    {UpperArm, {Clavicle, Hip, Hip, Hip}         },
+    {Forearm,  {UpperArm, Clavicle, Hip, Hip}    },
+    {Hand,     {Forearm, UpperArm, Clavicle, Hip}},
+    {Thigh,    {Hip, Hip, Hip, Hip}              },
+    {Shin,     {Thigh, Hip, Hip, Hip}            },
+    {Foot,     {Shin, Thigh, Hip, Hip}           },
+    {Toe,      {Foot, Shin, Thigh, Hip}          },
+};
+
+const CNode* CarrierOf(const CBodyMap& body, BodyPlace place)
+{
+    const auto* row = std::ranges::find(kCarriers, place.joint, &Carrier::joint);
+    if (row == std::end(kCarriers))
+        return nullptr;
+    for (const EBodyJoint carrier : row->carriers)
+    {
+        if (const CNode* node = JointAt(body, {carrier, place.side}))
+            return node;
+    }
+    return nullptr;
+}
+
+// The joints of one limb in a chain from the trunk outward.
+struct MappedLimb
+{
+    std::vector<int> chain;
+    LimbJoints joints;
+    bool found = false;
+};
+
+class CBodyChecker
+{
+public:
+    CBodyChecker(const CBodyMap& body, const CJointTree& tree)
+        : m_kBody(body), m_kTree(tree), m_kLegs(LegsOf(tree, body))
+    {
+    }
+
+    std::vector<BodyDoubt> Check();
+
+private:
+    void Doubt(EBodyDoubt kind, BodyPlace place) { m_kDoubts.push_back({kind, place}); }
+    int Joint(BodyPlace place) const { return m_kTree.IndexOf(JointAt(m_kBody, place)); }
+    void CheckCarriers();
+    void CheckSides();
+    void CheckLegsDown();
+    void CheckLimb(ELimb limb, EBodySide side);
+    void CheckEvenness(BodyPlace place);
+    MappedLimb LimbOf(ELimb limb, EBodySide side) const;
+
+    const CBodyMap& m_kBody;
+    const CJointTree& m_kTree;
+    LegsOfBody m_kLegs;
+    std::vector<BodyDoubt> m_kDoubts;
+};
+
+std::vector<BodyDoubt> CBodyChecker::Check()
+{
+    CheckCarriers();
+    if (!m_kDoubts.empty()) // places say nothing of a tree that is none
+        return m_kDoubts;
+    CheckLegsDown();
+    CheckSides();
+    for (const EBodySide side : kBodySides)
+    {
+        CheckLimb(ELimb::Arm, side);
+        CheckLimb(ELimb::Leg, side);
+    }
+    for (const EBodyJoint joint : {UpperArm, Forearm, Thigh, Shin})
+        CheckEvenness({joint, EBodySide::Left});
+    return m_kDoubts;
+}
+
+void CBodyChecker::CheckCarriers()
+{
+    for (const BodyPlace& place : BodyPlaces())
+    {
+        const CNode* const node = JointAt(m_kBody, place);
+        const CNode* const carrier = CarrierOf(m_kBody, place);
+        if (node && carrier && (node == carrier || !IsAtOrBelow(node, carrier)))
+            Doubt(EBodyDoubt::NotBelow, place);
+    }
+}
+
+void CBodyChecker::CheckLegsDown()
+{
+    const CStances& stances = m_kTree.Stances();
+    const auto goesUp = [&](const LegsOfBody::Leg& leg, size_t stance) {
+        const Vec3 down = stances.Place(stance, leg.knee) - stances.Place(stance, leg.thigh);
+        return Vec3Dot(down, stances.Place(stance, m_kLegs.chest) - stances.Place(stance, m_kLegs.hip)) > 0.0;
+    };
+    for (const EBodySide side : kBodySides)
+    {
+        const LegsOfBody::Leg& leg = m_kLegs.legs[static_cast<size_t>(side)];
+        bool always = m_kLegs.hip >= 0 && m_kLegs.chest >= 0 && leg.thigh >= 0 && leg.knee >= 0;
+        for (size_t stance = 0; always && stance < stances.Count(); ++stance)
+            always = goesUp(leg, stance);
+        if (always)
+            Doubt(EBodyDoubt::LegsUp, {Thigh, side});
+    }
+}
+
+void CBodyChecker::CheckSides()
+{
+    if (JudgeSides(m_kTree, m_kLegs) < -kSidesSure)
+        Doubt(EBodyDoubt::SidesSwapped, {Thigh, EBodySide::Left});
+    const double arms =
+        JudgeAlong(m_kTree, m_kLegs, Joint({UpperArm, EBodySide::Left}), Joint({UpperArm, EBodySide::Right}));
+    if (arms < -kSidesSure)
+        Doubt(EBodyDoubt::SidesSwapped, {UpperArm, EBodySide::Left});
+}
+
+// The chain begins below the trunk, where the other side's limb parts, and goes on behind the limb's end.
+MappedLimb CBodyChecker::LimbOf(ELimb limb, EBodySide side) const
+{
+    constexpr size_t kMostBehind = 6;
+    constexpr size_t kLongestChain = 24;
+    const bool isArm = limb == ELimb::Arm;
+    const EBodyJoint first = isArm ? UpperArm : Thigh;
+    const EBodyJoint last = isArm ? Hand : Foot;
+    const EBodySide other = side == EBodySide::Left ? EBodySide::Right : EBodySide::Left;
+    const int upper = Joint({first, side});
+    const int lower = Joint({isArm ? Forearm : Shin, side});
+    const int end = Joint({last, side});
+    const int mirror = Joint({first, other});
+    if (upper < 0 || lower < 0 || end < 0 || mirror < 0)
+        return {};
+    MappedLimb mapped{m_kTree.WayDown(m_kTree.CommonAncestor(upper, mirror), end), {}, true};
+    for (const int joint : m_kTree.MainChain(m_kTree.MainChild(end), kMostBehind))
+        mapped.chain.push_back(joint);
+    const auto stopOf = [&](int joint) {
+        return static_cast<size_t>(std::ranges::find(mapped.chain, joint) - mapped.chain.begin());
+    };
+    mapped.joints = {stopOf(upper), stopOf(lower), stopOf(end)};
+    mapped.found = mapped.joints.end < mapped.chain.size() && mapped.chain.size() <= kLongestChain;
+    return mapped;
+}
+
+void CBodyChecker::CheckLimb(ELimb limb, EBodySide side)
+{
+    const BodyPlace place{limb == ELimb::Arm ? UpperArm : Thigh, side};
+    const MappedLimb mapped = LimbOf(limb, side);
+    if (!mapped.found)
+        return;
+    const LimbChains chains(&mapped.chain, 1);
+    const LimbFit fit = JudgeLimb(m_kTree, chains, limb, mapped.joints);
+    const LimbFit best = FitLimb(m_kTree, chains, limb);
+    if (!fit.found)
+        return Doubt(EBodyDoubt::OddLength, place);
+    if (!best.found || fit.cost < best.cost + kBetterChoice)
+        return;
+    if (limb == ELimb::Arm && best.joints.upper != mapped.joints.upper)
+        return Doubt(mapped.joints.upper < best.joints.upper ? EBodyDoubt::ArmIsClavicle
+                                                             : EBodyDoubt::ClavicleIsArm,
+                     place);
+    Doubt(EBodyDoubt::OddLength, place);
+}
+
+void CBodyChecker::CheckEvenness(BodyPlace place)
+{
+    const auto boneOf = [&](EBodySide side) {
+        const BodyPlace next{static_cast<EBodyJoint>(static_cast<int>(place.joint) + 1), side};
+        const int top = Joint({place.joint, side});
+        const int bottom = Joint(next);
+        double length = 0.0;
+        for (const int joint : top < 0 || bottom < 0 ? std::vector<int>() : m_kTree.WayDown(top, bottom))
+            length += m_kTree.Length(joint);
+        return length;
+    };
+    const double left = boneOf(EBodySide::Left);
+    const double right = boneOf(EBodySide::Right);
+    if (left > 0.0 && right > 0.0 && std::max(left / right, right / left) > kUneven)
+        Doubt(EBodyDoubt::OddLength, place);
+}
+
+CNode* RootOf(CNode* node)
+{
+    while (node->GetParentNode())
+        node = node->GetParentNode();
+    return node;
+}
+
+} // namespace
+
+std::vector<BodyDoubt> CheckBody(const CBodyMap& body, const CJointTree& tree)
+{
+    return CBodyChecker(body, tree).Check();
+}
+
+std::vector<BodyDoubt> CheckBody(const CBodyMap& body)
+{
+    for (const BodyPlace& place : BodyPlaces())
+    {
+        if (CNode* joint = JointAt(body, place))
+            return CheckBody(body, CJointTree(*RootOf(joint)));
+    }
+    return {};
+}
+
+} // namespace gw

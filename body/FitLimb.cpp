@@ -1,0 +1,191 @@
+// A limb has two long bones of about equal length that make up most of it. What stands before them (a
+// clavicle, a helper at the hip) and behind (hand, foot) is short. Twist joints lie on a bone's line in every
+// pose; a choice that runs a bone over a joint that bends pays for the bend. All this holds in any pose and
+// any unit.
+
+#include "FitLimb.h"
+
+#include "CJointTree.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+
+namespace gw {
+
+namespace {
+
+// What of a limb is usual, and what straying costs. Ratios are of lengths; found on skeletons of many makers.
+struct Norms
+{
+    double ratio;        // natural logarithm of upper by lower bone
+    double before;       // the way before the upper bone, of both bones
+    double beforeWeight; // for what is longer
+    double behind;       // the same for what comes behind the lower bone
+    double behindWeight;
+};
+constexpr Norms kArm{0.12, 0.60, 1.5, 0.45, 2.5};
+constexpr Norms kLeg{0.04, 0.20, 1.5, 0.40, 2.5};
+constexpr double kMostOfOnePart = 1.5;
+constexpr double kBendWeight = 4.0;
+constexpr double kShareWeight = 1.0;
+constexpr double kPassedJoint = 0.1;  // a bone seldom has joints inside
+constexpr double kPassedBranch = 0.5; // and never one that fingers or toes leave from
+constexpr double kAsLongBranch = 0.6; // of the longest; twist joints beside a bone reach half of it
+
+const Norms& NormsOf(ELimb limb)
+{
+    return limb == ELimb::Arm ? kArm : kLeg;
+}
+
+double Capped(double cost)
+{
+    return std::clamp(cost, 0.0, kMostOfOnePart);
+}
+
+// One chain as a line of stops: its joints and, behind the last of them, the end of its bone.
+class CLine
+{
+public:
+    CLine(const CJointTree& tree, const std::vector<int>& chain) : m_kTree(tree), m_kChain(chain)
+    {
+        double way = 0.0;
+        for (size_t i = 0; i < chain.size(); ++i)
+            m_kWay.push_back(way += i == 0 ? 0.0 : tree.Length(chain[i]));
+        m_kWay.push_back(way + tree.TipLength(chain.back()));
+        m_fReach = tree.Reach(chain.front()) - tree.Length(chain.front());
+    }
+
+    // From the first joint to the end of all that is below.
+    double Reach() const { return m_fReach; }
+    void SetReach(double reach) { m_fReach = reach; }
+    size_t LastStop() const { return m_kChain.size(); }
+    // What it costs a bone that its inner joints are passed over.
+    double PassedCost(size_t from, size_t to) const
+    {
+        double cost = 0.0;
+        for (size_t stop = from + 1; stop < to; ++stop)
+            cost += Way(stop, stop + 1) > 0.0 ? kPassedJoint + (Branches(stop) ? kPassedBranch : 0.0) : 0.0;
+        return cost;
+    }
+    double Way(size_t from, size_t to) const { return m_kWay[to] - m_kWay[from]; }
+    double WayBehind(size_t stop) const { return m_fReach - m_kWay[stop]; }
+    // By how much the way between two stops is longer than the straight line, in the pose that bends it most.
+    double Bend(size_t from, size_t to) const
+    {
+        if (to - from < 2)
+            return 0.0;
+        double most = 0.0;
+        const CStances& stances = m_kTree.Stances();
+        for (size_t stance = 0; stance < stances.Count(); ++stance)
+            most = std::max(most, BendAt(stance, from, to));
+        return most;
+    }
+
+private:
+    bool Branches(size_t stop) const
+    {
+        const std::vector<int>& children = m_kTree.Children(m_kChain[stop]);
+        const double least =
+            children.empty() ? 0.0 : kAsLongBranch * m_kTree.Reach(m_kTree.MainChild(m_kChain[stop]));
+        return std::ranges::count_if(children, [&](int child) { return m_kTree.Reach(child) >= least; }) > 1;
+    }
+    const Vec3& Place(size_t stance, size_t stop) const
+    {
+        const CStances& stances = m_kTree.Stances();
+        return stop == LastStop() ? stances.Tip(stance, m_kChain.back())
+                                  : stances.Place(stance, m_kChain[stop]);
+    }
+    double BendAt(size_t stance, size_t from, size_t to) const
+    {
+        double way = 0.0;
+        for (size_t stop = from; stop < to; ++stop)
+            way += Vec3Length(Place(stance, stop + 1) - Place(stance, stop));
+        const double straight = Vec3Length(Place(stance, to) - Place(stance, from));
+        return straight > 0.0 ? way / straight - 1.0 : kMostOfOnePart;
+    }
+
+    const CJointTree& m_kTree;
+    const std::vector<int>& m_kChain;
+    std::vector<double> m_kWay; // from the first joint to each stop
+    double m_fReach = 0.0;
+};
+
+LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)
+{
+    const double upper = line.Way(joints.upper, joints.lower);
+    const double lower = line.Way(joints.lower, joints.end);
+    LimbFit fit{joints, 0.0, upper + lower, upper > 0.0 && lower > 0.0};
+    if (!fit.found)
+        return fit;
+    const double before = line.Way(0, joints.upper) / fit.length;
+    const double behind = line.WayBehind(joints.end) / fit.length;
+    const double share = fit.length / (line.Way(0, joints.end) + std::max(line.WayBehind(joints.end), 0.0));
+    fit.cost = line.PassedCost(joints.upper, joints.lower) + line.PassedCost(joints.lower, joints.end) +
+               std::fabs(std::log(upper / lower) - norms.ratio) +
+               Capped(norms.beforeWeight * (before - norms.before)) +
+               Capped(norms.behindWeight * (behind - norms.behind)) +
+               Capped(kBendWeight * line.Bend(joints.upper, joints.lower)) +
+               Capped(kBendWeight * line.Bend(joints.lower, joints.end)) - kShareWeight * share;
+    return fit;
+}
+
+// The mean of both sides.
+LimbFit Judge(const std::vector<CLine>& lines, const Norms& norms, const LimbJoints& joints)
+{
+    LimbFit all{joints, 0.0, 0.0, true};
+    const double part = 1.0 / static_cast<double>(lines.size());
+    for (const CLine& line : lines)
+    {
+        const LimbFit fit = Judge(line, norms, joints);
+        all.found = all.found && fit.found;
+        all.cost += fit.cost * part;
+        all.length += fit.length * part;
+    }
+    return all;
+}
+
+std::vector<CLine> LinesOf(const CJointTree& tree, LimbChains chains)
+{
+    std::vector<CLine> lines;
+    double reach = std::numeric_limits<double>::max();
+    for (const std::vector<int>& chain : chains)
+        reach = std::min(reach, lines.emplace_back(tree, chain).Reach());
+    for (CLine& line : lines)
+        line.SetReach(reach); // what one side alone holds in its hand is no part of the limb
+    return lines;
+}
+
+} // namespace
+
+LimbFit JudgeLimb(const CJointTree& tree, LimbChains chains, ELimb limb, const LimbJoints& joints)
+{
+    return Judge(LinesOf(tree, chains), NormsOf(limb), joints);
+}
+
+LimbFit FitLimb(const CJointTree& tree, LimbChains chains, ELimb limb)
+{
+    const std::vector<CLine> lines = LinesOf(tree, chains);
+    const std::vector<int>& chain = chains.front();
+    const auto isHelper = [&](size_t stop) { return stop < chain.size() && tree.HasStandIn(chain[stop]); };
+    // A hand cannot do without a joint; a leg may end where the shin's bone does.
+    const size_t lastStop = limb == ELimb::Arm ? chain.size() - 1 : chain.size();
+    LimbFit best;
+    for (size_t upper = 0; upper < chain.size(); ++upper)
+    {
+        for (size_t lower = upper + 1; lower < chain.size(); ++lower)
+        {
+            for (size_t end = lower + 1; end <= lastStop; ++end)
+            {
+                if (isHelper(upper) || isHelper(lower) || isHelper(end))
+                    continue;
+                const LimbFit fit = Judge(lines, NormsOf(limb), {upper, lower, end});
+                if (fit.found && (!best.found || fit.cost < best.cost))
+                    best = fit;
+            }
+        }
+    }
+    return best;
+}
+
+} // namespace gw
