@@ -16,6 +16,7 @@ using Leg = LegsOfBody::Leg;
 constexpr double kFootLeast = 0.25; // sine of the angle from the shin to the foot
 constexpr double kKneeLeast = 0.05; // sine of the knee's angle
 constexpr double kKneeSure = 0.35;
+constexpr double kAlongAtRest = 0.5; // cosine
 constexpr double kSureAtRest =
     0.8; // of 2: both feet, as far as they point square to the line between the thighs
 // What the two say weighs differently: a knee is never bent the other way, but may turn outward.
@@ -131,8 +132,11 @@ double JudgeAlong(const CJointTree& tree, const LegsOfBody& body, int first, int
 {
     if (!IsWhole(body) || first < 0 || second < 0)
         return 0.0;
-    return MeanOfPoses(
-        tree, [&](const CPose& pose) { return Vec3Dot(pose.Direction(second, first), pose.Sideways(body)); });
+    const auto along = [&](const CPose& pose) {
+        return Vec3Dot(pose.Direction(second, first), pose.Sideways(body));
+    };
+    const double atRest = IsStance(tree, 0, body) ? along(CPose(tree, 0)) : 0.0;
+    return std::fabs(atRest) > kAlongAtRest ? std::copysign(1.0, atRest) : MeanOfPoses(tree, along);
 }
 
 bool IsStance(const CJointTree& tree, size_t stance, const LegsOfBody& body)
