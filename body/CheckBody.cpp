@@ -144,7 +144,7 @@ void CBodyChecker::CheckSides()
 // The chain begins below the trunk, where the other side's limb parts, and goes on behind the limb's end.
 MappedLimb CBodyChecker::LimbOf(ELimb limb, EBodySide side) const
 {
-    constexpr size_t kMostBehind = 6;
+    constexpr size_t kMostBehind = 1; // the knuckles, and not what is held in the hand
     constexpr size_t kLongestChain = 24;
     const bool isArm = limb == ELimb::Arm;
     const EBodyJoint first = isArm ? UpperArm : Thigh;

@@ -9,7 +9,6 @@
 
 #include <algorithm>
 #include <cmath>
-#include <limits>
 
 namespace gw {
 
@@ -23,9 +22,12 @@ struct Norms
     double beforeWeight; // for what is longer
     double behind;       // the same for what comes behind the lower bone
     double behindWeight;
+    double spread; // half the way between both sides' upper bones, of both bones
 };
-constexpr Norms kArm{0.12, 0.60, 1.5, 0.45, 2.5};
-constexpr Norms kLeg{0.04, 0.20, 1.5, 0.40, 2.5};
+constexpr Norms kArm{0.12, 0.60, 1.5, 0.45, 2.5, 0.34};
+constexpr Norms kLeg{0.04, 0.20, 1.5, 0.40, 2.5, 0.12};
+constexpr double kSpreadWeight = 0.4;
+constexpr double kMostOfSpread = 0.6;
 constexpr double kMostOfOnePart = 1.5;
 constexpr double kBendWeight = 4.0;
 constexpr double kShareWeight = 1.0;
@@ -53,12 +55,8 @@ public:
         for (size_t i = 0; i < chain.size(); ++i)
             m_kWay.push_back(way += i == 0 ? 0.0 : tree.Length(chain[i]));
         m_kWay.push_back(way + tree.TipLength(chain.back()));
-        m_fReach = tree.Reach(chain.front()) - tree.Length(chain.front());
     }
 
-    // From the first joint to the end of all that is below.
-    double Reach() const { return m_fReach; }
-    void SetReach(double reach) { m_fReach = reach; }
     size_t LastStop() const { return m_kChain.size(); }
     // What it costs a bone that its inner joints are passed over.
     double PassedCost(size_t from, size_t to) const
@@ -69,7 +67,7 @@ public:
         return cost;
     }
     double Way(size_t from, size_t to) const { return m_kWay[to] - m_kWay[from]; }
-    double WayBehind(size_t stop) const { return m_fReach - m_kWay[stop]; }
+    double WayBehind(size_t stop) const { return m_kWay.back() - m_kWay[stop]; }
     // By how much the way between two stops is longer than the straight line, in the pose that bends it most.
     double Bend(size_t from, size_t to) const
     {
@@ -82,6 +80,14 @@ public:
         return most;
     }
 
+    const Vec3& Place(size_t stance, size_t stop) const
+    {
+        const CStances& stances = m_kTree.Stances();
+        return stop == LastStop() ? stances.Tip(stance, m_kChain.back())
+                                  : stances.Place(stance, m_kChain[stop]);
+    }
+    size_t StanceCount() const { return m_kTree.Stances().Count(); }
+
 private:
     bool Branches(size_t stop) const
     {
@@ -89,12 +95,6 @@ private:
         const double least =
             children.empty() ? 0.0 : kAsLongBranch * m_kTree.Reach(m_kTree.MainChild(m_kChain[stop]));
         return std::ranges::count_if(children, [&](int child) { return m_kTree.Reach(child) >= least; }) > 1;
-    }
-    const Vec3& Place(size_t stance, size_t stop) const
-    {
-        const CStances& stances = m_kTree.Stances();
-        return stop == LastStop() ? stances.Tip(stance, m_kChain.back())
-                                  : stances.Place(stance, m_kChain[stop]);
     }
     double BendAt(size_t stance, size_t from, size_t to) const
     {
@@ -108,7 +108,6 @@ private:
     const CJointTree& m_kTree;
     const std::vector<int>& m_kChain;
     std::vector<double> m_kWay; // from the first joint to each stop
-    double m_fReach = 0.0;
 };
 
 LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)
@@ -120,7 +119,7 @@ LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)
         return fit;
     const double before = line.Way(0, joints.upper) / fit.length;
     const double behind = line.WayBehind(joints.end) / fit.length;
-    const double share = fit.length / (line.Way(0, joints.end) + std::max(line.WayBehind(joints.end), 0.0));
+    const double share = fit.length / (line.Way(0, joints.end) + line.WayBehind(joints.end));
     fit.cost = line.PassedCost(joints.upper, joints.lower) + line.PassedCost(joints.lower, joints.end) +
                std::fabs(std::log(upper / lower) - norms.ratio) +
                Capped(norms.beforeWeight * (before - norms.before)) +
@@ -128,6 +127,25 @@ LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)
                Capped(kBendWeight * line.Bend(joints.upper, joints.lower)) +
                Capped(kBendWeight * line.Bend(joints.lower, joints.end)) - kShareWeight * share;
     return fit;
+}
+
+// What it costs that the upper bones of both sides begin too near to each other, or too far, in the pose
+// where they are farthest: a chain of helpers and twist joints in a straight arm shows no better where it
+// begins.
+double SpreadCost(const CLine& a, const CLine& b, double norm, const LimbJoints& joints)
+{
+    double widest = 0.0;
+    for (size_t stance = 0; stance < a.StanceCount(); ++stance)
+    {
+        const auto bone = [&](size_t from, size_t to) {
+            return Vec3Length(a.Place(stance, to) - a.Place(stance, from));
+        };
+        const double limb = bone(joints.upper, joints.lower) + bone(joints.lower, joints.end);
+        const double half = 0.5 * Vec3Length(a.Place(stance, joints.upper) - b.Place(stance, joints.upper));
+        widest = std::max(widest, limb > 0.0 ? half / limb : 0.0);
+    }
+    const double cost = widest > 0.0 ? kSpreadWeight * std::fabs(std::log(widest / norm)) : kMostOfSpread;
+    return std::min(cost, kMostOfSpread);
 }
 
 // The mean of both sides.
@@ -142,17 +160,16 @@ LimbFit Judge(const std::vector<CLine>& lines, const Norms& norms, const LimbJoi
         all.cost += fit.cost * part;
         all.length += fit.length * part;
     }
+    if (all.found && lines.size() > 1)
+        all.cost += SpreadCost(lines[0], lines[1], norms.spread, joints);
     return all;
 }
 
 std::vector<CLine> LinesOf(const CJointTree& tree, LimbChains chains)
 {
     std::vector<CLine> lines;
-    double reach = std::numeric_limits<double>::max();
     for (const std::vector<int>& chain : chains)
-        reach = std::min(reach, lines.emplace_back(tree, chain).Reach());
-    for (CLine& line : lines)
-        line.SetReach(reach); // what one side alone holds in its hand is no part of the limb
+        lines.emplace_back(tree, chain);
     return lines;
 }
 

@@ -1,0 +1,87 @@
+#pragma once
+
+#include "BodyJoints.h"
+#include "CMotionFile.h"
+#include "Mat3.h"
+
+#include <map>
+#include <memory>
+#include <random>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+/// A human skeleton made after a recipe, with names that say nothing, written as a motion file and loaded. It
+/// stands in metres or centimetres, its joints a little off from left to right, as measured ones are.
+///
+/// A recipe is words with blanks in between:
+/// spine1 ... spine10, neck0 ... neck3  numbers of joints; else three and one
+/// noclavicle, notoes, nofeet           joints that are not there; a foot without a toe has a bone to its tip
+/// bare                                 end joints have no bones
+/// fingers, toes5, face, headend        joints beyond hands, feet and head
+/// helpers                              a joint before each limb that carries its offset, and one of length 0
+/// hipjoints                            a short joint between pelvis and thigh
+/// twist, twistleaf                     joints inside the long bones, or hanging beside them
+/// root, prop, sword, tail              a joint above the hip at the floor; things that hang about
+/// rightfirst, torsofirst               the order of children; else the left leg comes first
+/// zup, turned                          up is z; the body looks along -x
+/// apose, down                          the arms at rest; else they stretch sideways
+/// nopose                               at rest all bones lie along x, and frames show how it stands
+/// walk                                 frames in which it walks
+/// child, longarms                      proportions
+class CMadeSkeleton
+{
+public:
+    CMadeSkeleton(std::string_view recipe, unsigned seed);
+
+    CNode& Root() const { return *m_kMotion.motionRoot; }
+    const CMotionFile& Motion() const { return m_kMotion; }
+    /// The name of a place of the body; empty where the skeleton has none.
+    std::string NameAt(BodyPlace place) const;
+
+private:
+    struct Joint
+    {
+        std::string name;
+        Vec3 place; // in a stance with y up and the body looking along z
+        Joint* parent = nullptr;
+        std::vector<std::unique_ptr<Joint>> children;
+        Vec3 tip = kVec3Zero;   // of an end joint, from its place
+        Vec3 swing = kVec3Zero; // amplitude of turns about the axes while it walks, degrees
+        Mat3 world = kMat3Identity;
+    };
+
+    bool Has(std::string_view word) const;
+    int Number(std::string_view word, int otherwise) const;
+    double Jitter(double value);
+    Joint& Add(Joint* parent, const Vec3& place);
+    Joint& AddAt(Joint& parent, const Vec3& place, BodyPlace role);
+    Joint& AddBone(Joint& from, const Vec3& to, BodyPlace role, bool twists);
+    Joint& AddHelpers(Joint& parent, const Vec3& place);
+    void AddBody();
+    void AddTrunk(Joint& hip);
+    void AddLeg(Joint& hip, EBodySide side);
+    void AddFoot(Joint& ankle, EBodySide side, float x);
+    void AddArm(Joint& chest, EBodySide side);
+    void AddFingers(Joint& hand, const Vec3& along);
+    void AddHead(Joint& chest);
+    void TurnFrames(Joint& joint);
+    Vec3 World(const Vec3& place) const;
+    Vec3 OffsetOf(const Joint& joint) const;
+    void WriteJoint(std::string& text, const Joint& joint, bool isRoot) const;
+    void AppendRotations(std::string& row, const Joint& joint, const Mat3& parentTurn, double phase) const;
+    std::string Text() const;
+
+    std::string m_kRecipe;
+    std::mt19937 m_kRandom;
+    std::unique_ptr<Joint> m_spkRoot;
+    std::map<size_t, std::string> m_kRoles; // by IndexOf
+    CMotionFile m_kMotion;
+};
+
+/// Recipes of the shapes that skeletons come in.
+std::vector<std::string> SkeletonRecipes();
+
+} // namespace gw
