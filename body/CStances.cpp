@@ -14,7 +14,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kMostFrames = 16;
-constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 12 MB with the tips
+constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 31 MB with tips and turns
 
 const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
 {
@@ -88,18 +88,30 @@ int CStances::IndexOf(const CNode* joint) const
     return found == m_kIndex.end() ? -1 : found->second;
 }
 
+void CStances::BeginPose()
+{
+    m_kPlaces.emplace_back().reserve(m_kJoints.size());
+    m_kTips.emplace_back().reserve(m_kJoints.size());
+    m_kTurns.emplace_back().reserve(m_kJoints.size());
+}
+
+void CStances::AddJoint(size_t joint, const Mat4& world)
+{
+    m_kPlaces.back().push_back(world.Translation());
+    m_kTips.back().push_back(TransformCoord(m_kLocalTips[joint], world));
+    m_kTurns.back().push_back(NormalizedRows(world));
+}
+
 void CStances::AddRestPose()
 {
+    BeginPose();
     std::vector<Mat4> worlds;
-    Places& places = m_kPlaces.emplace_back();
-    Places& tips = m_kTips.emplace_back();
     for (size_t i = 0; i < m_kJoints.size(); ++i)
     {
         const int parent = IndexOf(m_kJoints[i]->GetParentNode());
         const Mat4& local = RestLocal(*m_kJoints[i]);
         worlds.push_back(parent < 0 ? local : local * worlds[static_cast<size_t>(parent)]);
-        places.push_back(worlds.back().Translation());
-        tips.push_back(TransformCoord(m_kLocalTips[i], worlds.back()));
+        AddJoint(i, worlds.back());
     }
 }
 
@@ -117,13 +129,9 @@ void CStances::AddFrames()
     for (size_t i = 0; i < count; ++i)
     {
         sampler.Pose(static_cast<double>(i * frames / count));
-        Places& places = m_kPlaces.emplace_back();
-        Places& tips = m_kTips.emplace_back();
+        BeginPose();
         for (size_t joint = 0; joint < m_kJoints.size(); ++joint)
-        {
-            places.push_back(m_kJoints[joint]->m_kWorldMatrix.Translation());
-            tips.push_back(TransformCoord(m_kLocalTips[joint], m_kJoints[joint]->m_kWorldMatrix));
-        }
+            AddJoint(joint, m_kJoints[joint]->m_kWorldMatrix);
     }
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Mat3.h"
+#include "Mat4.h"
 #include "Vec3.h"
 
 #include <cstddef>
@@ -33,9 +35,14 @@ public:
     /// Where the bone of an end joint ends; the joint's own place where that is not known.
     const Vec3& Tip(size_t stance, int joint) const { return m_kTips[stance][static_cast<size_t>(joint)]; }
 
+    /// The rotation of a joint in a pose, from its own space to the world.
+    const Mat3& Turn(size_t stance, int joint) const { return m_kTurns[stance][static_cast<size_t>(joint)]; }
+
 private:
     using Places = std::vector<Vec3>;
 
+    void BeginPose();
+    void AddJoint(size_t joint, const Mat4& world);
     void AddRestPose();
     void AddFrames();
 
@@ -44,6 +51,7 @@ private:
     Places m_kLocalTips; // in the joint's space
     std::vector<Places> m_kPlaces;
     std::vector<Places> m_kTips;
+    std::vector<std::vector<Mat3>> m_kTurns;
 };
 
 /// Where the bone of a node without node children ends, in the node's space; the origin where that is not

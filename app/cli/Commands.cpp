@@ -54,6 +54,14 @@ constexpr CCommand kCommands[] = {
     Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
         "List the installed profiles; with a source, which fit and what the others miss.",
         "gaitwright profiles walk.bvh"),
+    Row("suggest", "SOURCE", kOutput | kForce, kOutput, RunSuggest,
+        "Make a profile for a skeleton that no installed one fits.\n"
+        "Joints are found by their names, else by the shape of the skeleton: mirrored limbs, which end is "
+        "up,\n"
+        "where the feet point. Every row is listed with what it is taken from and how sure that is; look at\n"
+        "the rows that are called unsure before you convert many files with the profile.\n"
+        "OUT ends in .prf. Convert with --profile OUT, or keep it with your own profiles.",
+        "gaitwright suggest strange.bvh -o strange.prf"),
     Row("compare", "SOURCE RESULT", kProfile, kProfile, RunCompare,
         "Measure a conversion: how far the result's bones, feet and path differ.",
         "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),

@@ -68,6 +68,7 @@ EExit RunResave(const COptions& options);
 EExit RunExtract(const COptions& options);
 EExit RunPackage(const COptions& options);
 EExit RunProfiles(const COptions& options);
+EExit RunSuggest(const COptions& options);
 EExit RunCompare(const COptions& options);
 EExit RunDump(const COptions& options);
 EExit RunRender(const COptions& options);

@@ -1,0 +1,132 @@
+#include "BoneOffset.h"
+
+#include "Angles.h"
+#include "CPoseMatcher.h"
+#include "Euler.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <cstdlib>
+#include <vector>
+
+namespace gw {
+
+namespace {
+
+// What a degree of turn about the bone counts against one of the bone's direction.
+constexpr double kTwistWeight = 0.1;
+
+Vec3 Through(const Vec3& v, const Mat3& m)
+{
+    return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
+}
+
+// All signed permutations that are rotations, the neutral one first.
+std::vector<AxisCodes> AxisRotations()
+{
+    std::vector<AxisCodes> rotations;
+    for (const AxisCodes& order : std::initializer_list<AxisCodes>{
+             {1, 2, 3},
+             {2, 3, 1},
+             {3, 1, 2},
+             {1, 3, 2},
+             {2, 1, 3},
+             {3, 2, 1}
+    })
+    {
+        for (int signs = 0; signs < 8; ++signs)
+        {
+            const auto signedBy = [&](int bit) { return (signs >> bit) & 1 ? -1 : 1; };
+            const AxisCodes codes{order[0] * signedBy(0), order[1] * signedBy(1), order[2] * signedBy(2)};
+            const Mat3 matrix = AxisMatrix(codes);
+            if (Vec3Dot(Vec3Cross(matrix.Row(0), matrix.Row(1)), matrix.Row(2)) > 0.0)
+                rotations.push_back(codes);
+        }
+    }
+    return rotations;
+}
+
+using Degrees = std::array<float, 3>;
+
+// The angles that are left for a rotation behind its axis codes.
+Degrees AnglesBehind(const AxisCodes& codes, const Mat3& rotation)
+{
+    Degrees angles{};
+    Mat3ToEuler(Mat3Transpose(AxisMatrix(codes)) * rotation, static_cast<int>(EEulerOrder::ZYX), angles[0],
+                angles[1], angles[2]);
+    for (float& angle : angles)
+        angle /= kDegreesToRadians;
+    return angles;
+}
+
+float Size(const Degrees& angles)
+{
+    return std::fabs(angles[0]) + std::fabs(angles[1]) + std::fabs(angles[2]);
+}
+
+double DegreesApart(const Vec3& a, const Vec3& b)
+{
+    return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) / kDegreesToRadians64;
+}
+
+// How far the numbers are from a rotation, in degrees; `axis` counts for all, the other directions a little.
+double Distance(const CRowNumbers& numbers, const Mat3& rotation, const Vec3& axis)
+{
+    const Mat3 offset = OffsetOf(numbers);
+    double twist = 0.0;
+    for (int row = 0; row < 3; ++row)
+        twist = std::max(twist, DegreesApart(offset.Row(row), rotation.Row(row)));
+    return DegreesApart(Through(axis, offset), Through(axis, rotation)) + kTwistWeight * twist;
+}
+
+} // namespace
+
+Mat3 ShortestTurn(const Vec3& from, const Vec3& to)
+{
+    const Vec3 a = Vec3Normalized(from);
+    const Vec3 b = Vec3Normalized(to);
+    Vec3 axis = Vec3Cross(a, b);
+    const double sine = Vec3Length(axis);
+    const double cosine = Vec3Dot(a, b);
+    if (sine < 1e-7)
+    {
+        if (cosine >= 0.0)
+            return kMat3Identity;
+        axis = Vec3Cross(a, std::fabs(a.x) < 0.7f ? kVec3UnitX : kVec3UnitZ); // any half turn does
+    }
+    return Mat3FromAxisAngle(Vec3Normalized(axis), static_cast<float>(std::atan2(sine, cosine)));
+}
+
+Mat3 OffsetOf(const CRowNumbers& numbers)
+{
+    const auto& [x, y, z] = numbers.rotation;
+    return OffsetRotation({static_cast<float>(x), static_cast<float>(y), static_cast<float>(z)},
+                          AxisMatrix(numbers.axes));
+}
+
+CRowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis)
+{
+    static const std::vector<AxisCodes> kRotations = AxisRotations();
+    const auto size = [&](const AxisCodes& codes) { return std::round(Size(AnglesBehind(codes, rotation))); };
+    const AxisCodes codes = *std::ranges::min_element(kRotations, {}, size);
+    const Degrees angles = AnglesBehind(codes, rotation);
+    CRowNumbers best;
+    double least = 360.0;
+    for (int step = 0; step < 27; ++step)
+    {
+        const std::array<int, 3> steps{step % 3 - 1, step / 3 % 3 - 1, step / 9 - 1};
+        CRowNumbers numbers{{}, codes};
+        for (size_t i = 0; i < steps.size(); ++i)
+            numbers.rotation[i] = static_cast<int>(std::lround(angles[i])) + steps[i];
+        const double distance = Distance(numbers, rotation, axis);
+        if (distance < least)
+        {
+            least = distance;
+            best = numbers;
+        }
+    }
+    return best;
+}
+
+} // namespace gw

@@ -1,0 +1,173 @@
+// A row's offset O stands left of the source bone's rotation S: the target bone's is O · S. So where the
+// source bone points in its own space, there O must take the direction of the target bone; any pose tells the
+// same. What is free is the turn about the bone. It is taken from a pose in which the source stands: there
+// the target stands in its own rest pose, turned to where the source looks, and each bone swings from there
+// to its direction the short way round.
+
+#include "CRowTurner.h"
+
+#include "Angles.h"
+#include "BoneOffset.h"
+#include "Euler.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+Vec3 Through(const Vec3& v, const Mat3& m)
+{
+    return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
+}
+
+// Which element is the sine depends on the bone's share type: 2 for arms as they come, 1 without a share file
+// and for all other bones.
+bool IsSineOne(const Mat3& local, const HostRow& host)
+{
+    constexpr float kOne = 0.999998f; // a tenth of a degree away
+    const bool isArm = host.joint >= EBodyJoint::Clavicle && host.joint <= EBodyJoint::Hand;
+    return std::fabs(local.m[3]) > kOne || (isArm && std::fabs(local.m[6]) > kOne);
+}
+
+// Whether the angles of a file give a rotation back.
+bool IsGivenBack(const Mat3& rotation)
+{
+    constexpr float kSame = 0.9999f; // cosine, four fifths of a degree
+    const Mat3 read = EulerToMat3("ZYX", Mat3ToEulerDegrees(rotation));
+    return Vec3Dot(read.Row(0), rotation.Row(0)) > kSame && Vec3Dot(read.Row(1), rotation.Row(1)) > kSame;
+}
+
+} // namespace
+
+CRowTurner::CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const CTargetBones& target,
+                       const RowJoints& joints)
+    : m_kTree(tree), m_kPoses(poses), m_kTarget(target), m_kJoints(joints), m_uiReference(poses.Reference()),
+      m_kFacing(poses.Facing(m_uiReference))
+{
+    for (size_t row = 0; row < kHostRowCount; ++row)
+    {
+        if (m_kJoints[row] != CJointTree::kNone && kHostRows[row].aim != EHostAim::None)
+            Turn(row);
+    }
+    for (size_t row = 0; row < kHostRowCount; ++row)
+    {
+        if (m_kJoints[row] != CJointTree::kNone)
+            KeepOffPoles(row);
+    }
+}
+
+Vec3 CRowTurner::Axis(size_t row) const
+{
+    const HostRow& host = kHostRows[row];
+    return host.aim == EHostAim::Child ? m_kTarget.ChildAxis(host.target) : kVec3UnitY;
+}
+
+// The joint that a source bone's direction leads to, or none.
+int CRowTurner::AimOf(size_t row) const
+{
+    const HostRow& host = kHostRows[row];
+    if (host.aim == EHostAim::Child)
+        return m_kPoses.JointBelow(m_kJoints[row], CJointTree::kNone);
+    const size_t last = row + static_cast<size_t>(host.next);
+    for (size_t next = row + 1; host.aim == EHostAim::Next && next <= last; ++next)
+    {
+        if (m_kJoints[next] != CJointTree::kNone)
+            return m_kPoses.JointBelow(m_kJoints[row], m_kJoints[next]);
+    }
+    return CJointTree::kNone;
+}
+
+// Where a source bone points at rest, in its own space.
+Vec3 CRowTurner::RestAim(size_t row, int aim) const
+{
+    const int joint = m_kJoints[row];
+    return Through(m_kPoses.Direction(0, joint, aim), Mat3Transpose(m_kPoses.BoneTurn(0, joint)));
+}
+
+// Where a bone should point in the reference pose; nothing where it should stand as it does at rest.
+std::optional<Vec3> CRowTurner::ReferenceDirection(size_t row, int aim) const
+{
+    const int joint = m_kJoints[row];
+    if (aim != CJointTree::kNone)
+        return m_kPoses.Direction(m_uiReference, joint, aim);
+    if (kHostRows[row].aim != EHostAim::Hand)
+        return std::nullopt;
+    Vec3 knuckles = kVec3Zero;
+    for (const int child : m_kTree.Children(joint))
+        knuckles = knuckles + m_kPoses.Direction(m_uiReference, joint, child);
+    const bool known = Vec3Length(knuckles) > 0.0;
+    return known ? Vec3Normalized(knuckles) : ReferenceDirection(row - 1, AimOf(row - 1));
+}
+
+void CRowTurner::Turn(size_t row)
+{
+    const int aim = AimOf(row);
+    const Vec3 axis = Axis(row);
+    Mat3 turn = m_kTarget.RestTurn(kHostRows[row].target) * m_kFacing;
+    if (const std::optional<Vec3> direction = ReferenceDirection(row, aim))
+        turn = turn * ShortestTurn(Through(axis, turn), *direction);
+    Mat3 offset = turn * Mat3Transpose(m_kPoses.BoneTurn(m_uiReference, m_kJoints[row]));
+    // A joint in between that turns by itself moves the aim; the rest pose is what counts.
+    if (aim != CJointTree::kNone)
+        offset = offset * ShortestTurn(Through(axis, offset), RestAim(row, aim));
+    m_kNumbers[row] = NearestOffset(offset, axis);
+}
+
+std::optional<double> CRowTurner::RestError(size_t row) const
+{
+    const int aim = m_kJoints[row] == CJointTree::kNone ? CJointTree::kNone : AimOf(row);
+    if (aim == CJointTree::kNone)
+        return std::nullopt;
+    const Vec3 reached = Through(Axis(row), OffsetOf(m_kNumbers[row]));
+    const Vec3 wanted = RestAim(row, aim);
+    return std::atan2(Vec3Length(Vec3Cross(reached, wanted)), Vec3Dot(reached, wanted)) / kDegreesToRadians64;
+}
+
+// Whether a child's rotation against its parent's gets lost: a conversion cannot decompose it before the
+// offset (see CPoseMatcher), or the angles in the result's file do not give it back behind it. Both happen
+// where the sine of a middle angle is 1, and bones that are stiff in the source stay there for ever.
+bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const
+{
+    for (const size_t stance : {size_t{0}, m_uiReference})
+    {
+        const Mat3 above = OffsetOf(numbers) * m_kPoses.BoneTurn(stance, m_kJoints[row]);
+        const Mat3 local = m_kPoses.BoneTurn(stance, m_kJoints[child]) * Mat3Transpose(above);
+        if (IsSineOne(local, kHostRows[child]) || !IsGivenBack(OffsetOf(m_kNumbers[child]) * local))
+            return true;
+    }
+    return false;
+}
+
+bool CRowTurner::HasChildAtPole(size_t row, const CRowNumbers& numbers) const
+{
+    for (size_t child = row + 1; child < kHostRowCount; ++child)
+    {
+        const HostRow& host = kHostRows[child];
+        const bool isChild = host.parent == static_cast<int>(child - row) && host.aim != EHostAim::None;
+        if (isChild && m_kJoints[child] != CJointTree::kNone && IsAtPole(row, numbers, child))
+            return true;
+    }
+    return false;
+}
+
+// Turns a bone about itself where a bone below it, one with an offset of its own, would hang at a pole.
+void CRowTurner::KeepOffPoles(size_t row)
+{
+    constexpr float kNudges[] = {2.0f, -2.0f, 4.0f, -4.0f}; // degrees
+    if (!HasChildAtPole(row, m_kNumbers[row]))
+        return;
+    const Vec3 axis = Axis(row);
+    for (const float nudge : kNudges)
+    {
+        const Mat3 turn = Mat3FromAxisAngle(axis, nudge * kDegreesToRadians);
+        const CRowNumbers numbers = NearestOffset(turn * OffsetOf(m_kNumbers[row]), axis);
+        if (HasChildAtPole(row, numbers))
+            continue;
+        m_kNumbers[row] = numbers;
+        m_kNudged[row] = true;
+        return;
+    }
+}
+
+} // namespace gw

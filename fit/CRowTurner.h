@@ -1,0 +1,56 @@
+#pragma once
+
+#include "CSourcePoses.h"
+#include "CTargetBones.h"
+#include "HostRows.h"
+#include "ProfileFile.h"
+
+#include <array>
+#include <cstddef>
+#include <iterator>
+#include <optional>
+
+namespace gw {
+
+inline constexpr size_t kHostRowCount = std::size(kHostRows);
+/// The source joints of the host rows, by index in the source's tree; CJointTree::kNone for a row without
+/// one.
+using RowJoints = std::array<int, kHostRowCount>;
+
+/// Finds offsets and axis codes for the rows of a profile.
+class CRowTurner
+{
+public:
+    /// The tree, the poses and the target must outlive it. The body in the tree must be whole.
+    CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const CTargetBones& target,
+               const RowJoints& joints);
+
+    const CRowNumbers& Numbers(size_t row) const { return m_kNumbers[row]; }
+    /// Whether a row is turned about its bone by a degree or two more than it needs to, to keep a bone below
+    /// it from where a conversion could not follow.
+    bool IsNudged(size_t row) const { return m_kNudged[row]; }
+    /// The angle between both bones' directions in the source's rest pose, degrees; nothing for a bone that
+    /// ends in no joint.
+    std::optional<double> RestError(size_t row) const;
+
+private:
+    void Turn(size_t row);
+    void KeepOffPoles(size_t row);
+    bool HasChildAtPole(size_t row, const CRowNumbers& numbers) const;
+    bool IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const;
+    int AimOf(size_t row) const;
+    Vec3 Axis(size_t row) const;
+    Vec3 RestAim(size_t row, int aim) const;
+    std::optional<Vec3> ReferenceDirection(size_t row, int aim) const;
+
+    const CJointTree& m_kTree;
+    const CSourcePoses& m_kPoses;
+    const CTargetBones& m_kTarget;
+    const RowJoints& m_kJoints;
+    size_t m_uiReference;
+    Mat3 m_kFacing;
+    std::array<CRowNumbers, kHostRowCount> m_kNumbers{};
+    std::array<bool, kHostRowCount> m_kNudged{};
+};
+
+} // namespace gw

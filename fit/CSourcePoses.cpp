@@ -1,0 +1,88 @@
+#include "CSourcePoses.h"
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CNode.h"
+
+#include <algorithm>
+#include <cmath>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+// The axes of a body at rest are those of the file, but for what a leaning spine or uneven hips make of them.
+Mat3 SnappedToAxes(const Mat3& axes)
+{
+    constexpr float kNear = 0.85f; // cosine, 32 degrees
+    Mat3 snapped{};
+    for (size_t i = 0; i < std::size(snapped.m); ++i)
+        snapped.m[i] = std::fabs(axes.m[i]) > kNear ? std::copysign(1.0f, axes.m[i]) : 0.0f;
+    const bool isWhole = Vec3Dot(Vec3Cross(snapped.Row(0), snapped.Row(1)), snapped.Row(2)) > 0.0;
+    return isWhole ? snapped : axes;
+}
+
+} // namespace
+
+size_t CSourcePoses::Reference() const
+{
+    for (size_t stance = 0; stance < Count(); ++stance)
+    {
+        if (IsStance(m_kTree, stance, m_kLegs))
+            return stance;
+    }
+    return std::min<size_t>(1, Count() - 1);
+}
+
+Mat3 CSourcePoses::Facing(size_t stance) const
+{
+    const BodyAxes axes = AxesOf(m_kTree, stance, m_kLegs);
+    Mat3 facing;
+    facing.SetRow(0, axes.left);
+    facing.SetRow(1, axes.up);
+    facing.SetRow(2, axes.forward);
+    return stance == 0 ? SnappedToAxes(facing) : facing;
+}
+
+Mat3 CSourcePoses::BoneTurn(size_t stance, int joint) const
+{
+    const CBoneMesh* mesh = FindBoneMesh(*m_kTree.Node(joint));
+    const Mat3& turn = m_kTree.Stances().Turn(stance, joint);
+    return mesh ? NormalizedRows(mesh->m_kMatrix) * turn : turn;
+}
+
+Vec3 CSourcePoses::Direction(size_t stance, int from, int to) const
+{
+    const CStances& stances = m_kTree.Stances();
+    return Vec3Normalized(stances.Place(stance, to) - stances.Place(stance, from));
+}
+
+bool CSourcePoses::AreApart(int a, int b) const
+{
+    constexpr double kSamePlace = 1e-6; // as bones are compared
+    const CStances& stances = m_kTree.Stances();
+    const double size = 1.0 + Vec3Length(stances.Place(0, a));
+    return Vec3Length(stances.Place(0, b) - stances.Place(0, a)) > kSamePlace * size;
+}
+
+int CSourcePoses::JointBelow(int joint, int goal) const
+{
+    const std::vector<int> way = goal < 0 ? std::vector<int>() : m_kTree.WayDown(joint, goal);
+    int at = joint;
+    for (const int next : way)
+    {
+        at = next;
+        if (AreApart(joint, at))
+            return at;
+    }
+    while (!m_kTree.Children(at).empty())
+    {
+        at = m_kTree.Children(at).front();
+        if (AreApart(joint, at))
+            return at;
+    }
+    return CJointTree::kNone;
+}
+
+} // namespace gw

@@ -1,0 +1,57 @@
+#pragma once
+
+#include "BodyJoints.h"
+
+#include <cstddef>
+#include <cstdint>
+
+namespace gw {
+
+/// Where the direction of a bone of the host skeleton comes from.
+enum class EHostAim : uint8_t
+{
+    None,
+    Next,  ///< towards the next joint that has a row
+    Child, ///< towards the joint below, where there is one: a foot
+    Hand,  ///< towards the knuckles, else as the forearm
+    Head,  ///< upright in a stance
+};
+
+/// What drives a bone of the host skeleton, and how it hangs together with others.
+struct HostRow
+{
+    const char* target;
+    EBodyJoint joint;
+    EBodySide side;
+    EHostAim aim;
+    int next;   ///< how many of the rows behind it may be its next joint, the first that has a source counts
+    int parent; ///< how many rows before it the row of its parent stands; 0 where that has no source
+};
+
+/// The host skeleton's bones, in the order of its profiles.
+inline constexpr HostRow kHostRows[] = {
+    {"LowerTorso", EBodyJoint::Hip,      EBodySide::Left,  EHostAim::Next,  2, 0},
+    {"Waist",      EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  1, 1},
+    {"UpperTorso", EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  2, 1},
+    {"Neck",       EBodyJoint::Neck,     EBodySide::Left,  EHostAim::Next,  1, 1},
+    {"Head",       EBodyJoint::Head,     EBodySide::Left,  EHostAim::Head,  0, 1},
+    {"LCollar",    EBodyJoint::Clavicle, EBodySide::Left,  EHostAim::Next,  1, 3},
+    {"LUpperArm",  EBodyJoint::UpperArm, EBodySide::Left,  EHostAim::Next,  1, 1},
+    {"LForearm",   EBodyJoint::Forearm,  EBodySide::Left,  EHostAim::Next,  1, 1},
+    {"LHand",      EBodyJoint::Hand,     EBodySide::Left,  EHostAim::Hand,  0, 1},
+    {"RCollar",    EBodyJoint::Clavicle, EBodySide::Right, EHostAim::Next,  1, 7},
+    {"RUpperArm",  EBodyJoint::UpperArm, EBodySide::Right, EHostAim::Next,  1, 1},
+    {"RForearm",   EBodyJoint::Forearm,  EBodySide::Right, EHostAim::Next,  1, 1},
+    {"RHand",      EBodyJoint::Hand,     EBodySide::Right, EHostAim::Hand,  0, 1},
+    {"LPelvis",    EBodyJoint::Hip,      EBodySide::Left,  EHostAim::None,  0, 0},
+    {"LThigh",     EBodyJoint::Thigh,    EBodySide::Left,  EHostAim::None,  0, 0},
+    {"LCalf",      EBodyJoint::Shin,     EBodySide::Left,  EHostAim::None,  0, 1},
+    {"LFoot",      EBodyJoint::Foot,     EBodySide::Left,  EHostAim::Child, 0, 1},
+    {"RPelvis",    EBodyJoint::Hip,      EBodySide::Right, EHostAim::None,  0, 0},
+    {"RThigh",     EBodyJoint::Thigh,    EBodySide::Right, EHostAim::None,  0, 0},
+    {"RCalf",      EBodyJoint::Shin,     EBodySide::Right, EHostAim::None,  0, 1},
+    {"RFoot",      EBodyJoint::Foot,     EBodySide::Right, EHostAim::Child, 0, 1},
+};
+inline constexpr size_t kWaistRow = 1;
+
+} // namespace gw
