@@ -50,7 +50,8 @@ CRowTurner::CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const 
         if (m_kJoints[row] != CJointTree::kNone && kHostRows[row].aim != EHostAim::None)
             Turn(row);
     }
-    for (size_t row = 0; row < kHostRowCount; ++row)
+    // A bone that is turned may itself come to hang at a pole, so the bones above follow.
+    for (size_t row = kHostRowCount; row-- > 0;)
     {
         if (m_kJoints[row] != CJointTree::kNone)
             KeepOffPoles(row);
@@ -144,14 +145,14 @@ bool CRowTurner::HasChildAtPole(size_t row, const CRowNumbers& numbers) const
     for (size_t child = row + 1; child < kHostRowCount; ++child)
     {
         const HostRow& host = kHostRows[child];
-        const bool isChild = host.parent == static_cast<int>(child - row) && host.aim != EHostAim::None;
+        const bool isChild = host.parent == static_cast<int>(child - row);
         if (isChild && m_kJoints[child] != CJointTree::kNone && IsAtPole(row, numbers, child))
             return true;
     }
     return false;
 }
 
-// Turns a bone about itself where a bone below it, one with an offset of its own, would hang at a pole.
+// Turns a bone about itself where a bone below it would hang at a pole.
 void CRowTurner::KeepOffPoles(size_t row)
 {
     constexpr float kNudges[] = {2.0f, -2.0f, 4.0f, -4.0f}; // degrees
