@@ -140,8 +140,28 @@ bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) 
     return false;
 }
 
-bool CRowTurner::HasChildAtPole(size_t row, const CRowNumbers& numbers) const
+// The same for a thigh in a result's file. It hangs from a pelvis bone that stays as it is at rest.
+bool CRowTurner::IsThighAtPole(size_t row, const CRowNumbers& numbers) const
 {
+    const size_t hip = 0;
+    if (kHostRows[row].joint != EBodyJoint::Thigh || m_kJoints[hip] == CJointTree::kNone)
+        return false;
+    const Mat3 pelvis = m_kTarget.RestTurn(kHostRows[row - 1].target) *
+                        Mat3Transpose(m_kTarget.RestTurn(kHostRows[hip].target));
+    for (const size_t stance : {size_t{0}, m_uiReference})
+    {
+        const Mat3 above = pelvis * OffsetOf(m_kNumbers[hip]) * m_kPoses.BoneTurn(stance, m_kJoints[hip]);
+        const Mat3 world = OffsetOf(numbers) * m_kPoses.BoneTurn(stance, m_kJoints[row]);
+        if (!IsGivenBack(world * Mat3Transpose(above)))
+            return true;
+    }
+    return false;
+}
+
+bool CRowTurner::IsNearPole(size_t row, const CRowNumbers& numbers) const
+{
+    if (IsThighAtPole(row, numbers))
+        return true;
     for (size_t child = row + 1; child < kHostRowCount; ++child)
     {
         const HostRow& host = kHostRows[child];
@@ -152,18 +172,18 @@ bool CRowTurner::HasChildAtPole(size_t row, const CRowNumbers& numbers) const
     return false;
 }
 
-// Turns a bone about itself where a bone below it would hang at a pole.
+// Turns a bone about itself where it or a bone below it would hang at a pole.
 void CRowTurner::KeepOffPoles(size_t row)
 {
     constexpr float kNudges[] = {2.0f, -2.0f, 4.0f, -4.0f}; // degrees
-    if (!HasChildAtPole(row, m_kNumbers[row]))
+    if (!IsNearPole(row, m_kNumbers[row]))
         return;
     const Vec3 axis = Axis(row);
     for (const float nudge : kNudges)
     {
         const Mat3 turn = Mat3FromAxisAngle(axis, nudge * kDegreesToRadians);
         const CRowNumbers numbers = NearestOffset(turn * OffsetOf(m_kNumbers[row]), axis);
-        if (HasChildAtPole(row, numbers))
+        if (IsNearPole(row, numbers))
             continue;
         m_kNumbers[row] = numbers;
         m_kNudged[row] = true;

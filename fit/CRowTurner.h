@@ -36,7 +36,8 @@ public:
 private:
     void Turn(size_t row);
     void KeepOffPoles(size_t row);
-    bool HasChildAtPole(size_t row, const CRowNumbers& numbers) const;
+    bool IsNearPole(size_t row, const CRowNumbers& numbers) const;
+    bool IsThighAtPole(size_t row, const CRowNumbers& numbers) const;
     bool IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const;
     int AimOf(size_t row) const;
     Vec3 Axis(size_t row) const;
