@@ -97,16 +97,16 @@ bool IsWhole(const LegsOfBody& body)
 
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body)
 {
-    LegsOfBody legs{
-        tree.IndexOf(body.hip), tree.IndexOf(body.spine.empty() ? body.head : body.spine.back()), {}};
-    // A spine of one joint at the hip's place points nowhere.
-    if (body.head)
-        legs.chest = tree.IndexOf(body.head);
+    CNode* const chest = body.spine.empty() ? nullptr : body.spine.back();
+    LegsOfBody legs{tree.IndexOf(body.hip), tree.IndexOf(body.head ? body.head : chest), {}};
     for (const EBodySide side : kBodySides)
     {
         const BodyLeg& leg = body.Leg(side);
-        legs.legs[static_cast<size_t>(side)] = {tree.IndexOf(leg.thigh), tree.IndexOf(leg.shin),
-                                                tree.IndexOf(leg.foot), tree.IndexOf(leg.toe)};
+        LegsOfBody::Leg& joints = legs.legs[static_cast<size_t>(side)];
+        joints = {tree.IndexOf(leg.thigh), tree.IndexOf(leg.shin), tree.IndexOf(leg.foot),
+                  tree.IndexOf(leg.toe)};
+        if (joints.toe < 0 && joints.ankle >= 0)
+            joints.toe = tree.MainChild(joints.ankle);
     }
     return legs;
 }

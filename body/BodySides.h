@@ -27,10 +27,10 @@ struct LegsOfBody
         int thigh = -1;
         int knee = -1;
         int ankle = -1;
-        int toe = -1;
+        int toe = -1; ///< or the joint that is below the ankle
     };
     int hip = -1;
-    int chest = -1;
+    int chest = -1; ///< or the head, where there is one
     std::array<Leg, 2> legs; ///< the left one first, as far as is known
 };
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body);

@@ -140,19 +140,21 @@ bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) 
     return false;
 }
 
-// The same for a thigh in a result's file. It hangs from a pelvis bone that stays as it is at rest.
-bool CRowTurner::IsThighAtPole(size_t row, const CRowNumbers& numbers) const
+// The same for bones that hang from no row: the root, and thighs, whose pelvis bones stay as they are at
+// rest.
+bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers) const
 {
-    const size_t hip = 0;
-    if (kHostRows[row].joint != EBodyJoint::Thigh || m_kJoints[hip] == CJointTree::kNone)
+    constexpr size_t kHip = 0;
+    const bool isThigh = kHostRows[row].joint == EBodyJoint::Thigh && m_kJoints[kHip] != CJointTree::kNone;
+    if (row != kHip && !isThigh)
         return false;
-    const Mat3 pelvis = m_kTarget.RestTurn(kHostRows[row - 1].target) *
-                        Mat3Transpose(m_kTarget.RestTurn(kHostRows[hip].target));
     for (const size_t stance : {size_t{0}, m_uiReference})
     {
-        const Mat3 above = pelvis * OffsetOf(m_kNumbers[hip]) * m_kPoses.BoneTurn(stance, m_kJoints[hip]);
         const Mat3 world = OffsetOf(numbers) * m_kPoses.BoneTurn(stance, m_kJoints[row]);
-        if (!IsGivenBack(world * Mat3Transpose(above)))
+        const Mat3 hip = OffsetOf(m_kNumbers[kHip]) * m_kPoses.BoneTurn(stance, m_kJoints[kHip]);
+        const Mat3 pelvis = m_kTarget.RestTurn(kHostRows[row - 1 * isThigh].target) *
+                            Mat3Transpose(m_kTarget.RestTurn(kHostRows[kHip].target));
+        if (!IsGivenBack(isThigh ? world * Mat3Transpose(pelvis * hip) : world))
             return true;
     }
     return false;
@@ -160,7 +162,7 @@ bool CRowTurner::IsThighAtPole(size_t row, const CRowNumbers& numbers) const
 
 bool CRowTurner::IsNearPole(size_t row, const CRowNumbers& numbers) const
 {
-    if (IsThighAtPole(row, numbers))
+    if (IsAtPole(row, numbers))
         return true;
     for (size_t child = row + 1; child < kHostRowCount; ++child)
     {

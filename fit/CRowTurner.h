@@ -37,7 +37,7 @@ private:
     void Turn(size_t row);
     void KeepOffPoles(size_t row);
     bool IsNearPole(size_t row, const CRowNumbers& numbers) const;
-    bool IsThighAtPole(size_t row, const CRowNumbers& numbers) const;
+    bool IsAtPole(size_t row, const CRowNumbers& numbers) const;
     bool IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const;
     int AimOf(size_t row) const;
     Vec3 Axis(size_t row) const;

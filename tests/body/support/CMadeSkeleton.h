@@ -30,7 +30,8 @@ namespace gw {
 /// apose, down                          the arms at rest; else they stretch sideways
 /// nopose                               at rest all bones lie along x, and frames show how it stands
 /// walk                                 frames in which it walks
-/// child, longarms                      proportions
+/// rest                                 the frames show the rest pose
+/// child, longarms, metres              proportions and unit
 class CMadeSkeleton
 {
 public:

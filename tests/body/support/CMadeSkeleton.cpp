@@ -326,6 +326,8 @@ void CMadeSkeleton::AppendRotations(std::string& row, const Joint& joint, const 
     const Mat3 local = joint.world * world * Mat3Transpose(parentWorld);
     Vec3 angles;
     Mat3ToEuler(local, static_cast<int>(EEulerOrder::ZXY), angles.x, angles.y, angles.z);
+    if (Has("rest"))
+        angles = kVec3Zero;
     row += Numbers(Vec3{angles.z, angles.x, angles.y} * (1.0f / kDegreesToRadians)) + ' ';
     for (const auto& child : joint.children)
         AppendRotations(row, *child, world, phase);

@@ -1,0 +1,236 @@
+#include "Angles.h"
+#include "ApplyRow.h"
+#include "BoneOffset.h"
+#include "CMadeSkeleton.h"
+#include "CRetargeter.h"
+#include "FindBone.h"
+#include "MeasureConversion.h"
+#include "ProfileFit.h"
+#include "SuggestProfile.h"
+#include "TempFolder.h"
+
+#include <algorithm>
+#include <gtest/gtest.h>
+#include <memory>
+#include <random>
+
+namespace gw {
+
+namespace {
+
+std::unique_ptr<CMotionFile> LoadTarget()
+{
+    auto target = std::make_unique<CMotionFile>();
+    EXPECT_TRUE(target->Load(GAITWRIGHT_ASSETS "base.htr"));
+    return target;
+}
+
+const SuggestedRow& RowOf(const SuggestedProfile& profile, std::string_view target)
+{
+    return *std::ranges::find(profile.rows, target, &SuggestedRow::target);
+}
+
+// What comes of a conversion by a profile's rows and the rules alone, out of its file.
+std::unique_ptr<CMotionFile> Convert(const CMotionFile& source, const CMapRowTable& rows)
+{
+    const auto target = LoadTarget();
+    CRetargeter retargeter;
+    retargeter.SetScenes(source.motionRoot.Get(), target->motionRoot.Get());
+    retargeter.LoadShares(GAITWRIGHT_ASSETS "KsBone.bsm");
+    const CBoneNames sources(source.motionRoot.Get());
+    const CBoneNames targets(target->motionRoot.Get());
+    for (int row = 0; row < rows.RowCount(); ++row)
+        EXPECT_NE(ApplyRow(rows, row, sources, targets, &retargeter), ERowFit::Missing);
+    retargeter.Retarget(0.0f, source.GetLastFrame(), 0.0f, source.GetFrequency(), kVec3Zero, true, false);
+    const CTempFolder folder;
+    auto result = std::make_unique<CMotionFile>();
+    EXPECT_TRUE(target->Save(folder.Path("result.htr"), 1.0f));
+    EXPECT_TRUE(result->Load(folder.Path("result.htr")));
+    return result;
+}
+
+ConversionMeasures Measure(const CMotionFile& source, const CMapRowTable& rows)
+{
+    const auto result = Convert(source, rows);
+    std::vector<BonePair> pairs;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        if (!rows.IsFixed(row))
+            pairs.push_back({FindBone(result->motionRoot.Get(), rows.Text(row, kTargetColumn)),
+                             FindBone(source.motionRoot.Get(), rows.Text(row, kSourceColumn))});
+    }
+    return MeasureConversion(ClipOf(source), ClipOf(*result), pairs);
+}
+
+TEST(SuggestProfile, EveryMadeSkeletonPointsAsItsSourceAtRest)
+{
+    for (const std::string& recipe : SkeletonRecipes())
+    {
+        SCOPED_TRACE(recipe);
+        const CMadeSkeleton made(recipe, 1);
+        const CMadeSkeleton atRest(recipe + " rest", 1);
+        const auto target = LoadTarget();
+        const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
+        EXPECT_TRUE(profile.missing.empty());
+        const CMapRowTable table = profile.Table();
+        EXPECT_TRUE(MeasureFit(table, &made.Root(), target->motionRoot.Get()).IsWhole());
+        const ConversionMeasures measures = Measure(atRest.Motion(), table);
+        double sum = 0.0;
+        int count = 0;
+        for (const BoneMeasures& bone : measures.bones)
+        {
+            const SuggestedRow& row = RowOf(profile, bone.target);
+            if (!bone.measured || row.kind != ESuggestedRow::Turned)
+                continue;
+            EXPECT_LT(bone.meanError, 1.0) << bone.target;
+            ASSERT_TRUE(row.restError) << bone.target;
+            EXPECT_NEAR(bone.meanError, *row.restError, 0.4) << bone.target;
+            sum += bone.meanError;
+            ++count;
+        }
+        EXPECT_GE(count, 8);
+        EXPECT_LT(sum / count, 0.5);
+    }
+}
+
+TEST(SuggestProfile, BonesThatAreRigidFollowInEveryFrame)
+{
+    for (const char* recipe : {"walk fingers", "nopose walk", "walk zup turned apose"})
+    {
+        SCOPED_TRACE(recipe);
+        const CMadeSkeleton made(recipe, 2);
+        const auto target = LoadTarget();
+        const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
+        const ConversionMeasures measures = Measure(made.Motion(), profile.Table());
+        for (const BoneMeasures& bone : measures.bones)
+        {
+            const bool isTurned = RowOf(profile, bone.target).kind == ESuggestedRow::Turned;
+            EXPECT_TRUE(!bone.measured || !isTurned || bone.largestError < 1.0) << bone.target;
+        }
+    }
+}
+
+TEST(SuggestProfile, ATPoseThatLooksAlongZNeedsNoTurns)
+{
+    const CMadeSkeleton made("metres", 1);
+    const auto target = LoadTarget();
+    const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
+    const auto result = Convert(CMadeSkeleton("metres rest", 1).Motion(), profile.Table());
+    // Every bone stands nearly as it does in the target's own rest pose, turns about itself included.
+    result->motionRoot->UpdateTransform(0.0f);
+    const auto rest = LoadTarget();
+    for (const char* name : {"UpperTorso", "Head", "LUpperArm", "LForearm", "LHand", "RUpperArm", "RHand"})
+    {
+        const Mat3 turn = NormalizedRows(FindBone(result->motionRoot.Get(), name)->m_kWorldMatrix);
+        rest->motionRoot->UpdateTransform(0.0f);
+        const Mat3 own = NormalizedRows(FindBone(rest->motionRoot.Get(), name)->m_kWorldMatrix);
+        for (int row = 0; row < 3; ++row)
+            EXPECT_GT(Vec3Dot(turn.Row(row), own.Row(row)), 0.96) << name;
+    }
+}
+
+TEST(SuggestProfile, RowsGoWithWhatTheSkeletonHas)
+{
+    const struct
+    {
+        const char* recipe;
+        const char* target;
+        ESuggestedRow kind;
+    } rows[] = {
+        {"spine1",      "Waist",   ESuggestedRow::NoSource},
+        {"spine2",      "Waist",   ESuggestedRow::Turned  },
+        {"neck0",       "Neck",    ESuggestedRow::NoSource},
+        {"noclavicle",  "LCollar", ESuggestedRow::NoSource},
+        {"",            "LPelvis", ESuggestedRow::Fixed   },
+        {"",            "LThigh",  ESuggestedRow::Neutral },
+        {"",            "RCalf",   ESuggestedRow::Neutral },
+        {"",            "LFoot",   ESuggestedRow::Turned  },
+        {"nofeet walk", "LFoot",   ESuggestedRow::NoSource},
+    };
+    const auto target = LoadTarget();
+    for (const auto& row : rows)
+    {
+        const CMadeSkeleton made(row.recipe, 1);
+        const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
+        EXPECT_EQ(RowOf(profile, row.target).kind, row.kind) << row.recipe << ", " << row.target;
+        const bool hasRow = profile.Table().FindTarget(row.target) != CMapRowTable::kNone;
+        EXPECT_EQ(hasRow, row.kind <= ESuggestedRow::Fixed) << row.recipe << ", " << row.target;
+    }
+}
+
+TEST(SuggestProfile, SaysWhatItIsUnsureOf)
+{
+    const auto target = LoadTarget();
+    const CMadeSkeleton clear("", 1);
+    const SuggestedProfile byShape = SuggestProfile(clear.Root(), *target->motionRoot);
+    EXPECT_EQ(RowOf(byShape, "LThigh").sureness, ERowSureness::Likely);
+    const CMadeSkeleton blind("notoes bare", 1);
+    const SuggestedProfile guessed = SuggestProfile(blind.Root(), *target->motionRoot);
+    EXPECT_FALSE(guessed.sidesAreSure);
+    EXPECT_EQ(RowOf(guessed, "LThigh").sureness, ERowSureness::Unsure);
+    EXPECT_EQ(RowOf(guessed, "Head").sureness, ERowSureness::Likely);
+}
+
+TEST(SuggestProfile, NamesThatAProfileCannotHoldAreLeftOut)
+{
+    const auto target = LoadTarget();
+    for (const char* name : {"upper arm", "", "*arm", "Hips"})
+    {
+        SCOPED_TRACE(name);
+        const CMadeSkeleton made("", 1);
+        made.Root().SetName("Hips"); // the last name would stand for the hip
+        const BodyPlace place{EBodyJoint::UpperArm, EBodySide::Right};
+        FindBone(&made.Root(), made.NameAt(place))->SetName(name);
+        const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
+        EXPECT_EQ(RowOf(profile, "RUpperArm").kind, ESuggestedRow::NoName);
+        EXPECT_EQ(profile.missing, std::vector<BodyPlace>{place});
+    }
+}
+
+TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
+{
+    std::mt19937 random(5);
+    std::uniform_real_distribution<float> angle(-3.1f, 3.1f);
+    for (int i = 0; i < 500; ++i)
+    {
+        const Mat3 rotation = Mat3FromAxisAngle(kVec3UnitX, angle(random)) *
+                              Mat3FromAxisAngle(kVec3UnitY, angle(random)) *
+                              Mat3FromAxisAngle(kVec3UnitZ, angle(random));
+        const CRowNumbers numbers = NearestOffset(rotation, kVec3UnitY);
+        const Mat3 offset = OffsetOf(numbers);
+        EXPECT_GT(Vec3Dot(offset.Row(1), rotation.Row(1)), std::cos(0.75f * kDegreesToRadians));
+        EXPECT_GT(Vec3Dot(offset.Row(0), rotation.Row(0)), std::cos(2.5f * kDegreesToRadians));
+        // Axis codes take the quarter turns, so that what is left is small.
+        for (const int degrees : numbers.rotation)
+            EXPECT_LE(std::abs(degrees), 65);
+    }
+}
+
+TEST(ShortestTurn, TakesOneDirectionToAnother)
+{
+    const Vec3 directions[] = {
+        kVec3UnitX, kVec3UnitY, kVec3UnitZ, -kVec3UnitX, -kVec3UnitY, {0.6f, 0.0f, -0.8f}
+    };
+    for (const Vec3& from : directions)
+    {
+        for (const Vec3& to : directions)
+        {
+            const Mat3 turn = ShortestTurn(from, to);
+            const Vec3 reached = turn.Row(0) * from.x + turn.Row(1) * from.y + turn.Row(2) * from.z;
+            EXPECT_GT(Vec3Dot(reached, to), 0.99999);
+        }
+    }
+}
+
+TEST(SuggestedName, IsReadable)
+{
+    EXPECT_EQ(SuggestedName("walk_01"), "walk 01");
+    EXPECT_EQ(SuggestedName(""), "Suggested");
+    EXPECT_EQ(SuggestedName("__"), "Suggested");
+    EXPECT_EQ(SuggestedName("a\nb"), "a b");
+    EXPECT_EQ(SuggestedName(std::string(300, 'x')).size(), 64u);
+}
+
+} // namespace
+
+} // namespace gw
