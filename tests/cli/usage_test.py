@@ -4,7 +4,7 @@ import shlex
 from harness import DONE, FAILED, USAGE, CliTest, main
 
 COMMANDS = ("convert", "batch", "info", "pose", "transcode", "resave", "extract", "package", "profiles", "compare",
-            "render", "dump")
+            "render", "dump", "suggest")
 
 WRONG = [  # what, arguments, words on standard error
     ("no command", "", ["a command is missing", "--help"]),
@@ -36,6 +36,7 @@ WRONG = [  # what, arguments, words on standard error
     ("a job that there is not", "batch . --job fbx", ["fbx", "htr|orn"]),
     ("contrary wishes", "convert a.bvh --force --skip-existing", ["exclude each other"]),
     ("a result of another kind", "convert a.bvh -o a.fbx", ["a.fbx", ".Kinetra", ".htr"]),
+    ("a profile of another kind", "suggest a.bvh -o a.txt", ["a.txt", ".prf"]),
     ("several sources without a folder", "convert a.bvh b.bvh", ["--out-dir"]),
     ("a name for several results", "convert a.bvh b.bvh -o c.htr --out-dir d", ["-o"]),
     ("two sources of one stem", "convert x/a.bvh y/a.bvh --out-dir d", ["y/a.bvh", "a.Kinetra"]),

@@ -1,0 +1,91 @@
+"""Profiles for skeletons that none fits: what is found, what is told, and that conversions take them."""
+import json
+import re
+
+from harness import DATA, DONE, FAILED, WALK, CliTest, main
+from made import BVH
+from pathlib import Path
+
+THIRTEEN = {"LowerTorso", "UpperTorso", "Head", *(side + bone for side in "LR" for bone in
+            ("UpperArm", "Forearm", "Hand", "Thigh", "Calf"))}
+
+
+def scrambled():
+    """The walk with names that say nothing, and what each was."""
+    names = {}
+
+    def rename(match):
+        new = f"n{len(names):02}q"
+        names[new] = match.group(2)
+        return match.group(1) + new
+
+    return re.sub(r"(ROOT |JOINT )(\w+)", rename, WALK.read_text()), names
+
+
+class Suggest(CliTest):
+    def test_names_and_shape_lead_to_the_same_profile(self):
+        text, names = scrambled()
+        self.write("strange.bvh", text)
+        self.write("walk.bvh", WALK.read_bytes())
+        by_name = json.loads(self.succeed("suggest", "walk.bvh", "-o", "walk.prf", "--json").out)
+        by_shape = json.loads(self.succeed("suggest", "strange.bvh", "-o", "strange.prf", "--json").out)
+        for named, shaped in zip(by_name["rows"], by_shape["rows"]):
+            self.assertEqual(named["source"], names.get(shaped["source"], ""), named["target"])
+            self.assertEqual(named.get("rotation"), shaped.get("rotation"), named["target"])
+        sure = {row["target"]: row.get("evidence") for row in by_name["rows"]}
+        self.assertEqual({sure[bone] for bone in THIRTEEN}, {"name-and-shape"})
+        self.assertEqual({row.get("evidence") for row in by_shape["rows"] if row["target"] in THIRTEEN}, {"shape"})
+
+    def test_a_conversion_takes_the_profile(self):
+        self.write("strange_walk.bvh", scrambled()[0])
+        self.assertEqual(self.with_assets("convert", "strange_walk.bvh", "-o", "a.htr").code, FAILED)
+        told = self.succeed("suggest", "strange_walk.bvh", "-o", "new.prf")
+        for bone in THIRTEEN:
+            self.assertRegex(told.out, rf"(?m)^{bone} .* likely: ")
+        self.assertTrue(self.read("new.prf").startswith(b"strange walk\n"))
+        self.succeed("convert", "strange_walk.bvh", "-o", "a.htr", "--profile", "new.prf", "--no-legs")
+        measured = json.loads(self.succeed("compare", "strange_walk.bvh", "a.htr", "--profile", "new.prf", "--json").out)
+        bones = {bone["target"]: bone for bone in measured["bones"] if bone["measured"]}
+        for bone in ("LUpperArm", "RForearm", "Neck", "UpperTorso"):
+            self.assertLess(bones[bone]["meanError"], 1.0, bone)
+
+    def test_what_is_no_body_is_refused_with_what_is_missing(self):
+        self.write("small.bvh", BVH)
+        result = self.with_assets("suggest", "small.bvh", "-o", "small.prf")
+        self.assertEqual((result.code, result.out), (FAILED, ""))
+        self.assert_words(result, ["small.bvh", "missing", "left upper arm", "right shin"])
+        self.assertEqual(self.files(), ["small.bvh"])
+
+    def test_a_profile_that_exists_stays_unless_forced(self):
+        self.write("walk.bvh", WALK.read_bytes())
+        self.write("old.prf", "mine")
+        result = self.with_assets("suggest", "walk.bvh", "-o", "old.prf")
+        self.assertEqual((result.code, self.read("old.prf")), (FAILED, b"mine"))
+        self.assert_words(result, ["old.prf", "--force"])
+        self.succeed("suggest", "walk.bvh", "-o", "old.prf", "--force")
+        self.assertTrue(self.read("old.prf").startswith(b"walk\n"))
+
+    def test_failures_leave_no_file(self):
+        self.write("walk.bvh", WALK.read_bytes())
+        for what, arguments in (("no source", ("none.bvh", "-o", "a.prf")),
+                                ("no folder", ("walk.bvh", "-o", "none/a.prf")),
+                                ("no target", ("walk.bvh", "-o", "a.prf", "--data-dir", "nothing"))):
+            with self.subTest(what):
+                run = self.run_program if "--data-dir" in arguments else self.with_assets
+                self.assertEqual(run("suggest", *arguments).code, FAILED)
+                self.assertEqual(self.files(), ["walk.bvh"])
+
+    def test_real_files_get_whole_profiles(self):
+        for path in sorted(Path(DATA, "bvh").glob("*.bvh")) if DATA else []:
+            with self.subTest(path.name):
+                result = self.with_assets("suggest", path, "-o", "a.prf", "--force", "--json")
+                if result.code == FAILED:  # two are no bodies, one has an empty line where none may stand
+                    self.assertRegex(result.err, "missing|empty line")
+                    continue
+                rows = {row["target"]: row for row in json.loads(result.out)["rows"]}
+                self.assertEqual({rows[bone]["sureness"] for bone in THIRTEEN}, {"sure"})
+                self.succeed("convert", path, "-o", "a.htr", "--profile", "a.prf", "--force")
+
+
+if __name__ == "__main__":
+    main()
