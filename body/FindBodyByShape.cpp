@@ -45,38 +45,44 @@ bool IsInChains(const CJointTree& tree, int joint, const LimbPair& pair)
         pair.chains, [&](const std::vector<int>& chain) { return tree.IsAtOrBelow(joint, chain.front()); });
 }
 
-// The branch of the chest that goes on to the head: what rises highest away from the legs, over all poses.
-int FindNeck(const CJointTree& tree, const FoundLimbs& limbs, int hip)
+// How high a branch rises over the joint that it leaves, away from the legs, summed over all poses.
+double RiseOf(const CJointTree& tree, const FoundLimbs& limbs, int branch)
 {
-    const int chest = limbs.arms.pair.joint;
+    constexpr size_t kDeepest = 8; // joints of neck and head: a plait hangs down again
     const CStances& stances = tree.Stances();
+    const std::vector<int> chain = tree.MainChain(branch, kDeepest);
+    double rise = 0.0;
+    for (size_t stance = 0; stance < stances.Count(); ++stance)
+    {
+        const Vec3& top = stances.Place(stance, tree.Parent(branch));
+        const Vec3& left = stances.Place(stance, limbs.legs.Lower(0));
+        const Vec3& right = stances.Place(stance, limbs.legs.Lower(1));
+        const Vec3 up = Vec3Normalized(top - (left + right) * 0.5f);
+        double highest = 0.0;
+        for (const int joint : chain)
+            highest = std::max({highest, Vec3Dot(stances.Place(stance, joint) - top, up),
+                                Vec3Dot(stances.Tip(stance, joint) - top, up)});
+        rise += highest;
+    }
+    return rise;
+}
+
+// The branch of the chest that goes on to the head: what rises highest beside the arms.
+int FindNeck(const CJointTree& tree, const FoundLimbs& limbs)
+{
+    const LimbPair& arms = limbs.arms.pair;
     int neck = CJointTree::kNone;
     double highest = 0.0;
-    for (const int child : tree.Children(chest))
+    for (const int child : tree.Children(arms.joint))
     {
-        if (child == limbs.arms.pair.chains[0].front() || child == limbs.arms.pair.chains[1].front() ||
-            tree.IsAtOrBelow(hip, child))
+        const bool isArm = child == arms.chains[0].front() || child == arms.chains[1].front();
+        if (isArm || tree.IsAtOrBelow(limbs.legs.pair.joint, child))
             continue;
-        constexpr size_t kDeepest = 8; // joints of neck and head: a plait hangs down again
-        double rise = 0.0;
-        for (size_t stance = 0; stance < stances.Count(); ++stance)
-        {
-            const Vec3& top = stances.Place(stance, chest);
-            const Vec3 knees =
-                (stances.Place(stance, limbs.legs.Lower(0)) + stances.Place(stance, limbs.legs.Lower(1))) *
-                0.5f;
-            const Vec3 up = Vec3Normalized(top - knees);
-            double most = 0.0;
-            for (const int joint : tree.MainChain(child, kDeepest))
-                most = std::max({most, Vec3Dot(stances.Place(stance, joint) - top, up),
-                                 Vec3Dot(stances.Tip(stance, joint) - top, up)});
-            rise += most;
-        }
-        if (rise > highest)
-        {
-            highest = rise;
-            neck = child;
-        }
+        const double rise = RiseOf(tree, limbs, child);
+        if (rise <= highest)
+            continue;
+        highest = rise;
+        neck = child;
     }
     return neck;
 }
@@ -117,7 +123,7 @@ FoundLimbs FindLimbs(const CJointTree& tree)
                 continue;
             FoundLimbs found{leg, arm, 0.0};
             found.score = ScoreLimbs(tree, found);
-            if (found.score <= best.score || FindNeck(tree, found, leg.pair.joint) == CJointTree::kNone)
+            if (found.score <= best.score || FindNeck(tree, found) == CJointTree::kNone)
                 continue;
             best = found;
         }
@@ -158,7 +164,7 @@ void FillTrunk(const CJointTree& tree, const FoundLimbs& limbs, CBodyMap& body)
     const int hip = tree.CommonAncestor(limbs.legs.pair.joint, chest);
     body.hip = tree.Node(hip);
     body.spine = NodesAt(tree, tree.WayDown(hip, chest));
-    const std::vector<int> chain = tree.MainChain(FindNeck(tree, limbs, limbs.legs.pair.joint), kLongestNeck);
+    const std::vector<int> chain = tree.MainChain(FindNeck(tree, limbs), kLongestNeck);
     const size_t head = FindHead(tree, chain, limbs.legs.fit.length);
     body.neck = NodesAt(tree, std::span(chain).first(head));
     body.head = tree.Node(chain[head]);

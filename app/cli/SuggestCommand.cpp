@@ -190,11 +190,37 @@ bool WriteProfile(const std::string& path, const std::string& text)
     return false;
 }
 
+bool LoadTarget(const std::string& path, CMotionFile& target)
+{
+    const bool loaded = target.Load(path);
+    if (!loaded)
+        SayFailure(path, target.Record().Failure());
+    return loaded;
+}
+
+// Writes the profile and tells of it, row by row.
+EExit Deliver(const COptions& options, const SuggestedProfile& profile, int frameRate)
+{
+    const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
+    if (!WriteProfile(options.output, ProfileText(name, frameRate, kVec3Zero, profile.Table())))
+        return EExit::Failed;
+    if (!profile.restIsStance)
+        SayWord(options,
+                "the rest pose is none that a body stands in; how bones are turned about themselves was "
+                "taken from a frame of the motion");
+    if (options.json)
+    {
+        WriteJson(options, name, profile);
+        return EExit::Done;
+    }
+    PrintRows(profile);
+    return TellWritten(options, options.files[0], options.output);
+}
+
 } // namespace
 
 EExit RunSuggest(const COptions& options)
 {
-    const std::string& source = options.files[0];
     if (!HasExtension(options.output, ".prf"))
     {
         SayError(Printable(options.output) + ": a profile's file ends in .prf");
@@ -205,32 +231,15 @@ EExit RunSuggest(const COptions& options)
     CShellWindow window(options);
     CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
     CShellContent content(window, platform);
-    window.SetPaths(source, {});
-    if (content.OpenSource() == 0 || window.HasFailed() || !content.SourceRoot())
+    window.SetPaths(options.files[0], {});
+    CMotionFile target;
+    if (content.OpenSource() == 0 || window.HasFailed() || !content.SourceRoot() ||
+        !LoadTarget(platform.DataFolder() + "base.htr", target))
         return EExit::Failed;
-    CMotionFile base;
-    const std::string basePath = platform.DataFolder() + "base.htr";
-    if (!base.Load(basePath))
-    {
-        SayFailure(basePath, base.Record().Failure());
-        return EExit::Failed;
-    }
-    const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *base.motionRoot);
+    const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *target.motionRoot);
     if (!profile.missing.empty())
-        return FailMissing(source, profile);
-    const std::string name = SuggestedName(SplitPath(source).stem);
-    const int rate = FrameRateOf(content.SourceRoot());
-    if (!WriteProfile(options.output, ProfileText(name, rate, kVec3Zero, profile.Table())))
-        return EExit::Failed;
-    if (options.json)
-        WriteJson(options, name, profile);
-    else
-        PrintRows(profile);
-    if (!profile.restIsStance)
-        SayWord(options,
-                "the rest pose is none that a body stands in; how bones are turned about themselves was "
-                "taken from a frame of the motion");
-    return options.json ? EExit::Done : TellWritten(options, source, options.output);
+        return FailMissing(options.files[0], profile);
+    return Deliver(options, profile, FrameRateOf(content.SourceRoot()));
 }
 
 } // namespace gw

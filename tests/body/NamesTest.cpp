@@ -174,7 +174,10 @@ struct NamedSkeleton
     {
         std::string list = convention.leg;
         if (!variant.toes)
-            list.replace(list.rfind('|') + 1, list.npos, "-");
+        {
+            list.resize(list.rfind('|') + 1);
+            list += '-';
+        }
         const std::vector<CNode*> chain = AddChain(body.hip, list.c_str(), side);
         body.Leg(side) = {chain[1], chain[2], chain[3], chain[4]};
         AddExtras(chain[4] ? chain[4] : chain[3], kToeExtras, side);
