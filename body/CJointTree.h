@@ -2,7 +2,6 @@
 
 #include "CStances.h"
 
-#include <span>
 #include <vector>
 
 namespace gw {

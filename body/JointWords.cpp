@@ -303,7 +303,7 @@ JointName ReadJointName(std::string_view name)
     const uint32_t words = *features & ~(kSides | kJoint);
     joint.word = side ? WordOf(words, kSideMeanings) : WordOf(words, kMiddleMeanings);
     joint.side = side == kLeft ? ENameSide::Left : side == kRight ? ENameSide::Right : ENameSide::None;
-    joint.helper = (*features & kJoint) || lower.front() == '_';
+    joint.helper = (*features & kJoint) || lower.starts_with('_');
     return joint;
 }
 
