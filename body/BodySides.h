@@ -30,7 +30,7 @@ struct LegsOfBody
         int toe = -1; ///< or the joint that is below the ankle
     };
     int hip = -1;
-    int chest = -1; ///< or the head, where there is one
+    int chest = -1;          ///< or the head, where there is one
     std::array<Leg, 2> legs; ///< the left one first, as far as is known
 };
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body);
