@@ -1,0 +1,52 @@
+#include "CBVHExam.h"
+
+#include "CHierarchyCheck.h"
+#include "CLineCursor.h"
+#include "CMotionHeadCheck.h"
+#include "CRowMender.h"
+#include "CSafeFile.h"
+#include "CheckOffsets.h"
+#include "CheckSpikes.h"
+#include "CleanText.h"
+
+namespace gw {
+
+EFailure CBVHExam::Examine(const std::string& path)
+{
+    const EFailure failure = m_kFile.Open(path);
+    if (failure != EFailure::None)
+        return failure;
+    m_kText = CleanText(m_kFile.Text(), m_kClean, m_kFindings);
+    CLineCursor lines(m_kText);
+    if (!CHierarchyCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline) || m_kOutline.joints.empty())
+        return EFailure::None;
+    if (CMotionHeadCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline))
+        ReadRows(lines);
+    return EFailure::None;
+}
+
+void CBVHExam::ReadRows(CLineCursor& lines)
+{
+    CRowCheck check(m_kOutline, m_kFindings);
+    check.Read(lines);
+    m_bRows = true;
+    m_kPlan = check.Plan();
+    m_kPlan.subtrahends = CheckOffsets(m_kOutline, check.Table(), m_kFindings);
+    CheckSpikes(m_kOutline, check.Table(), m_kFindings);
+    m_kCells = check.Table().TakeMended();
+    if (m_kPlan.correctsCount)
+        m_kEdits.Replace(m_kOutline.framesBegin, m_kOutline.framesLength, std::to_string(m_kPlan.rowCount));
+}
+
+bool CBVHExam::WriteMended(const std::string& path)
+{
+    CSafeFile file;
+    const size_t rowsBegin = m_bRows ? m_kOutline.rowsBegin : m_kText.size();
+    if (!file.Open(path) || !m_kEdits.Write(m_kText.substr(0, rowsBegin), file))
+        return false;
+    if (m_bRows && !CRowMender(m_kOutline, m_kPlan, m_kCells).Write(m_kText, file))
+        return false;
+    return file.Commit();
+}
+
+} // namespace gw

@@ -1,0 +1,276 @@
+#include "CHierarchyCheck.h"
+
+#include "CFindings.h"
+#include "CTextEdits.h"
+#include "CTextLines.h"
+#include "MotionNode.h"
+#include "NumberText.h"
+#include "Numbers.h"
+#include "TKBVHFile.h"
+
+#include <algorithm>
+#include <iterator>
+#include <string>
+#include <unordered_set>
+#include <utility>
+
+namespace gw {
+
+namespace {
+
+bool IsBrace(std::string_view token)
+{
+    return token == "{" || token == "}";
+}
+
+// The token at the front of a text, without taking it off.
+std::string_view FirstToken(std::string_view text)
+{
+    return NextToken(text);
+}
+
+// The part of a line up to the next brace, or the brace where it comes first, without blanks around it.
+std::string_view NextPart(std::string_view& rest)
+{
+    std::string_view token = NextToken(rest);
+    std::string_view part = token;
+    while (!token.empty() && !IsBrace(token) && !IsBrace(FirstToken(rest)))
+    {
+        token = NextToken(rest);
+        if (!token.empty())
+            part = {part.data(), static_cast<size_t>(token.data() + token.size() - part.data())};
+    }
+    return part;
+}
+
+int ChannelOf(std::string_view word)
+{
+    const auto isWord = [=](std::string_view name) { return EqualNoCase(name, word); };
+    const auto* const known = std::ranges::find_if(kChannelNames, isWord);
+    return known == std::end(kChannelNames) ? OutlineJoint::kNoChannel
+                                            : static_cast<int>(known - std::begin(kChannelNames));
+}
+
+} // namespace
+
+struct CHierarchyCheck::KeywordRow
+{
+    std::string_view keyword;
+    void (CHierarchyCheck::*read)(std::string_view rest);
+};
+
+const CHierarchyCheck::KeywordRow CHierarchyCheck::kKeywords[] = {
+    {"HIERARCHY", &CHierarchyCheck::BeginHierarchy},
+    {"ROOT",      &CHierarchyCheck::OpenRoot      },
+    {"JOINT",     &CHierarchyCheck::OpenJoint     },
+    {"End",       &CHierarchyCheck::OpenEndSite   },
+    {"}",         &CHierarchyCheck::CloseBlock    },
+    {"OFFSET",    &CHierarchyCheck::ReadOffset    },
+    {"CHANNELS",  &CHierarchyCheck::ReadChannels  },
+    {"MOTION",    &CHierarchyCheck::BeginMotion   },
+};
+
+bool CHierarchyCheck::Read(BVHOutline& outline)
+{
+    // The reader refuses more joints than it has room for; until then they stay in proportion to the file.
+    while (!m_bMotion && m_kJoints.size() <= kBoneLimit && m_kLines.Next())
+        ReadLine();
+    LookForSameNames();
+    LookForMixedChannels();
+    PlanColumns(outline);
+    outline.joints = std::move(m_kJoints);
+    return m_bMotion;
+}
+
+// A brace counts alone on its line; words that share one are put on lines of their own.
+void CHierarchyCheck::ReadLine()
+{
+    std::string_view rest = m_kLines.Line();
+    bool first = true;
+    bool shared = false;
+    for (std::string_view part = NextPart(rest); !part.empty(); part = NextPart(rest), first = false)
+    {
+        if (!first && m_bHierarchy)
+        {
+            if (!std::exchange(shared, true))
+                m_kFindings.Add(EFault::BraceOnLine, m_kLines.Number());
+            m_kEdits.Replace(m_kLines.OffsetOf(part), 0, "\n");
+        }
+        ReadWords(part);
+    }
+}
+
+// Whatever stands before the hierarchy is nobody's business.
+void CHierarchyCheck::ReadWords(std::string_view words)
+{
+    std::string_view rest = words;
+    const std::string_view word = NextToken(rest);
+    const auto isWord = [&](const KeywordRow& row) { return EqualNoCase(row.keyword, word); };
+    const auto* const row = std::ranges::find_if(kKeywords, isWord);
+    if (row == std::end(kKeywords) || (!m_bHierarchy && row != kKeywords))
+        return;
+    CheckSpelling(word, row->keyword);
+    (this->*row->read)(rest);
+}
+
+void CHierarchyCheck::CheckSpelling(std::string_view word, std::string_view wanted)
+{
+    if (word == wanted)
+        return;
+    m_kFindings.Add(EFault::KeywordSpelling, m_kLines.Number(), std::string(word));
+    m_kEdits.Replace(m_kLines.OffsetOf(word), word.size(), wanted);
+}
+
+void CHierarchyCheck::OpenRoot(std::string_view name)
+{
+    if (++m_uiRoots > 1)
+    {
+        m_kFindings.Add(EFault::SecondRoot, m_kLines.Number(), Quote(FirstToken(name)));
+        return m_kOpen.push_back(OutlineJoint::kNoParent);
+    }
+    Add(name, OutlineJoint::kNoParent);
+}
+
+// A joint outside all blocks belongs to the root; one in a block that is not read is not read either.
+void CHierarchyCheck::OpenJoint(std::string_view name)
+{
+    const size_t parent = m_kOpen.empty() ? 0 : m_kOpen.back();
+    if (m_kJoints.empty() || parent == OutlineJoint::kNoParent)
+        return m_kOpen.push_back(OutlineJoint::kNoParent);
+    Add(name, parent);
+}
+
+void CHierarchyCheck::Add(std::string_view name, size_t parent)
+{
+    m_kOpen.push_back(m_kJoints.size());
+    OutlineJoint joint;
+    joint.parent = parent;
+    joint.line = m_kLines.Number();
+    joint.name = ReadName(name);
+    m_kJoints.push_back(std::move(joint));
+}
+
+// Words up to a remark are a name that was meant as one.
+std::string CHierarchyCheck::ReadName(std::string_view name)
+{
+    const std::string_view first = NextToken(name);
+    std::string joined(first.substr(0, kNameLimit));
+    const char* end = first.data() + first.size();
+    for (std::string_view word = NextToken(name); !word.empty() && word.front() != '#';
+         word = NextToken(name))
+    {
+        joined = (joined + '_').append(word.substr(0, kNameLimit)).substr(0, kNameLimit);
+        end = word.data() + word.size();
+    }
+    const std::string_view whole(first.data(), static_cast<size_t>(end - first.data()));
+    if (whole.size() == first.size())
+        return joined;
+    m_kFindings.Add(EFault::BlankInName, m_kLines.Number(), Quote(whole));
+    m_kEdits.Replace(m_kLines.OffsetOf(whole), whole.size(), joined);
+    return joined;
+}
+
+void CHierarchyCheck::CloseBlock(std::string_view)
+{
+    if (!m_kOpen.empty())
+        m_kOpen.pop_back();
+}
+
+OutlineJoint* CHierarchyCheck::Joint()
+{
+    const bool none = m_kOpen.empty() || m_kOpen.back() == OutlineJoint::kNoParent;
+    return none ? nullptr : &m_kJoints[m_kOpen.back()];
+}
+
+void CHierarchyCheck::ReadOffset(std::string_view numbers)
+{
+    std::string points;
+    if (HasDecimalCommas(numbers, 3))
+    {
+        points = WithPoints(numbers);
+        m_kFindings.Add(EFault::DecimalComma, m_kLines.Number());
+        m_kEdits.Replace(m_kLines.OffsetOf(numbers), numbers.size(), points);
+        numbers = points;
+    }
+    Vec3 offset = kVec3Zero;
+    for (float* const component : {&offset.x, &offset.y, &offset.z})
+    {
+        const std::string_view token = NextToken(numbers);
+        ScanFloat(token, *component);
+        if (const auto fault = FaultOfNumber(token); fault && !token.empty())
+            m_kFindings.AddUnmended(*fault, m_kLines.Number(), Quote(token));
+    }
+    if (OutlineJoint* const joint = Joint())
+    {
+        joint->offset = offset;
+        joint->offsetLine = m_kLines.Number();
+    }
+}
+
+// Channels beyond the count are meant as such: whoever wrote the rows wrote a value for them. Other words
+// there are a remark.
+void CHierarchyCheck::ReadChannels(std::string_view rest)
+{
+    const auto count = static_cast<size_t>(std::max(ParseInt(NextToken(rest)), 0));
+    std::vector<int> channels;
+    for (std::string_view word = NextToken(rest); !word.empty(); word = NextToken(rest))
+    {
+        const int channel = ChannelOf(word);
+        if (channel == OutlineJoint::kNoChannel && channels.size() >= count)
+            break;
+        CheckChannel(word, channel);
+        channels.push_back(channel);
+    }
+    if (channels.size() > count)
+        m_kFindings.Add(EFault::ChannelCount, m_kLines.Number());
+    if (OutlineJoint* const joint = Joint())
+        joint->channels = std::move(channels);
+}
+
+void CHierarchyCheck::CheckChannel(std::string_view word, int channel)
+{
+    if (channel == OutlineJoint::kNoChannel)
+        m_kFindings.Add(EFault::UnknownChannel, m_kLines.Number(), Quote(word));
+    else
+        CheckSpelling(word, kChannelNames[channel]);
+}
+
+// The root takes a value also where it has no channels.
+void CHierarchyCheck::PlanColumns(BVHOutline& outline)
+{
+    for (OutlineJoint& joint : m_kJoints)
+    {
+        const size_t least = joint.parent == OutlineJoint::kNoParent ? 1 : 0;
+        joint.firstColumn = outline.columnCount;
+        outline.columnCount += std::max(joint.channels.size(), least);
+    }
+}
+
+void CHierarchyCheck::LookForSameNames()
+{
+    std::unordered_set<std::string_view> names;
+    for (const OutlineJoint& joint : m_kJoints)
+    {
+        if (!joint.name.empty() && !names.insert(joint.name).second)
+            m_kFindings.Add(EFault::SameName, joint.line, joint.name);
+    }
+}
+
+// Root and other joints may differ in positions; rotations that turn in different orders are what is told.
+void CHierarchyCheck::LookForMixedChannels()
+{
+    std::vector<int> usual;
+    for (const OutlineJoint& joint : m_kJoints)
+    {
+        std::vector<int> rotations = joint.channels;
+        std::erase_if(rotations, [](int channel) { return channel < kFirstRotation; });
+        if (rotations.empty())
+            continue;
+        if (usual.empty())
+            usual = rotations;
+        if (rotations != usual)
+            return m_kFindings.Add(EFault::MixedChannels, joint.line, joint.name);
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,63 @@
+#pragma once
+
+#include "BVHOutline.h"
+#include "CLineCursor.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <vector>
+
+namespace gw {
+
+class CFindings;
+class CTextEdits;
+
+/// Reads the hierarchy of a BVH text as a person would: what the strict reader refuses is understood where it
+/// can be, told as a finding, and mended by an edit of the text.
+class CHierarchyCheck
+{
+public:
+    CHierarchyCheck(CLineCursor& lines, CFindings& findings, CTextEdits& edits)
+        : m_kLines(lines), m_kFindings(findings), m_kEdits(edits)
+    {
+    }
+
+    /// Fills the outline's joints and leaves the cursor on the line "MOTION". False where that never comes.
+    bool Read(BVHOutline& outline);
+
+private:
+    struct KeywordRow;
+    static const KeywordRow kKeywords[];
+
+    void ReadLine();
+    void ReadWords(std::string_view words);
+    void BeginHierarchy(std::string_view) { m_bHierarchy = true; }
+    void BeginMotion(std::string_view) { m_bMotion = m_bHierarchy; }
+    void OpenRoot(std::string_view name);
+    void OpenJoint(std::string_view name);
+    void OpenEndSite(std::string_view) { m_kOpen.push_back(OutlineJoint::kNoParent); }
+    void CloseBlock(std::string_view);
+    void ReadOffset(std::string_view numbers);
+    void ReadChannels(std::string_view rest);
+    void CheckChannel(std::string_view word, int channel);
+
+    void Add(std::string_view name, size_t parent);
+    std::string ReadName(std::string_view name);
+    void CheckSpelling(std::string_view word, std::string_view wanted);
+    void PlanColumns(BVHOutline& outline);
+    void LookForSameNames();
+    void LookForMixedChannels();
+    OutlineJoint* Joint();
+
+    CLineCursor& m_kLines;
+    CFindings& m_kFindings;
+    CTextEdits& m_kEdits;
+    std::vector<OutlineJoint> m_kJoints;
+    std::vector<size_t> m_kOpen; // joints whose blocks are open, kNoParent for those that make none
+    size_t m_uiRoots = 0;
+    bool m_bHierarchy = false;
+    bool m_bMotion = false;
+};
+
+} // namespace gw

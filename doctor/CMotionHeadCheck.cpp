@@ -1,0 +1,124 @@
+#include "CMotionHeadCheck.h"
+
+#include "CFindings.h"
+#include "CTextEdits.h"
+#include "CTextLines.h"
+#include "NumberText.h"
+#include "Numbers.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <string>
+
+namespace gw {
+
+namespace {
+
+constexpr double kLongestFrame = 10.0; // seconds; from here on it is a rate
+
+// Takes the letters of a keyword off a text, in any case, with any blanks between them, with its colon or
+// without. False where others stand there.
+bool TakeKeyword(std::string_view keyword, std::string_view& text)
+{
+    std::string_view rest = text;
+    for (const char letter : keyword)
+    {
+        if (letter == ' ')
+            continue;
+        rest.remove_prefix(std::min(rest.find_first_not_of(kTokenDelimiters), rest.size()));
+        const bool fits = !rest.empty() && EqualNoCase(rest.substr(0, 1), {&letter, 1});
+        if (!fits && letter != ':')
+            return false;
+        rest.remove_prefix(fits);
+    }
+    text = rest;
+    return true;
+}
+
+// Whether the strict reader sees the keyword at the front of a line, with a value behind it.
+bool IsSpelled(std::string_view keyword, std::string_view line)
+{
+    for (std::string_view word = NextToken(keyword); !word.empty(); word = NextToken(keyword))
+    {
+        if (NextToken(line) != word)
+            return false;
+    }
+    return true;
+}
+
+} // namespace
+
+bool CMotionHeadCheck::Read(BVHOutline& outline)
+{
+    if (!ReadFrameCount(outline) || !ReadFrameTime(outline))
+        return false;
+    outline.rowsBegin = m_kLines.NextOffset();
+    outline.rowsLine = m_kLines.NextNumber();
+    return true;
+}
+
+bool CMotionHeadCheck::SkipEmptyLines()
+{
+    while (m_kLines.Next())
+    {
+        if (!m_kLines.IsBlank())
+            return true;
+        m_kFindings.Add(EFault::EmptyLineBeforeFrames, m_kLines.Number());
+        const size_t begin = m_kLines.OffsetOf(m_kLines.Line());
+        m_kEdits.Replace(begin, m_kLines.NextOffset() - begin, "");
+    }
+    return false;
+}
+
+// What stands behind a keyword on the next line.
+bool CMotionHeadCheck::NextValue(std::string_view keyword, std::string_view& value)
+{
+    if (!SkipEmptyLines())
+        return false;
+    const std::string_view line = m_kLines.Line();
+    value = line;
+    if (!TakeKeyword(keyword, value))
+        return false;
+    const auto begin = std::min(value.find_first_not_of(kTokenDelimiters), value.size());
+    value.remove_prefix(begin);
+    if (!value.empty() && !IsSpelled(keyword, line))
+    {
+        m_kFindings.Add(EFault::KeywordSpelling, m_kLines.Number(), Quote(line));
+        m_kEdits.Replace(m_kLines.OffsetOf(line), line.size() - value.size(), std::string(keyword) + ' ');
+    }
+    return !value.empty();
+}
+
+bool CMotionHeadCheck::ReadFrameCount(BVHOutline& outline)
+{
+    std::string_view value;
+    if (!NextValue("Frames:", value))
+        return false;
+    const std::string_view token = NextToken(value);
+    outline.framesLine = m_kLines.Number();
+    outline.framesBegin = m_kLines.OffsetOf(token);
+    outline.framesLength = token.size();
+    return ScanInt(token, outline.frameCount);
+}
+
+bool CMotionHeadCheck::ReadFrameTime(BVHOutline& outline)
+{
+    std::string_view value;
+    if (!NextValue("Frame Time:", value))
+        return false;
+    value = CutTrailing(value);
+    std::string points;
+    if (HasDecimalCommas(value, 1))
+    {
+        points = WithPoints(value);
+        m_kFindings.Add(EFault::DecimalComma, m_kLines.Number());
+        m_kEdits.Replace(m_kLines.OffsetOf(value), value.size(), points);
+        value = points;
+    }
+    outline.frameSeconds = ParseDouble(NextToken(value));
+    if (outline.frameSeconds >= kLongestFrame)
+        m_kFindings.Add(EFault::RateForTime, m_kLines.Number());
+    return true;
+}
+
+} // namespace gw

@@ -1,0 +1,222 @@
+#include "CRowCheck.h"
+
+#include "CFindings.h"
+#include "CTextLines.h"
+#include "NumberText.h"
+#include "Numbers.h"
+#include "RotationTurns.h"
+#include "TKBVHFile.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kLongestGap = 3; // frames without a number that may be made up from those beside them
+
+size_t CountTokens(std::string_view text)
+{
+    size_t count = 0;
+    while (!NextToken(text).empty())
+        ++count;
+    return count;
+}
+
+bool IsSeparator(char c)
+{
+    return kTokenDelimiters.find(c) != kTokenDelimiters.npos;
+}
+
+} // namespace
+
+void CRowCheck::Read(CLineCursor& lines)
+{
+    m_kTable = CRowTable(m_kOutline.columnCount);
+    while (lines.Next())
+    {
+        if (lines.IsBlank())
+        {
+            m_uiFirstEmptyLine = m_uiEmptyLines++ == 0 ? lines.Number() : m_uiFirstEmptyLine;
+            continue;
+        }
+        if (IsPastRows(lines.Line()))
+            break;
+        TellEmptyLines();
+        TellShortRow(false);
+        ReadRow(lines.Line(), lines.Number());
+        ++m_uiRows;
+    }
+    CompareCounts();
+    MendCells();
+}
+
+// Behind the last frame that is promised, what is no whole row is no row at all.
+bool CRowCheck::IsPastRows(std::string_view line) const
+{
+    if (m_kOutline.frameCount > 0 && m_uiRows < static_cast<size_t>(m_kOutline.frameCount))
+        return false;
+    if (!HasDecimalCommas(line, m_kOutline.columnCount) && CountTokens(line) != m_kOutline.columnCount)
+        return true;
+    return FaultOfNumber(NextToken(line)).has_value();
+}
+
+void CRowCheck::TellEmptyLines()
+{
+    const EFault fault = m_uiRows == 0 ? EFault::EmptyLineBeforeFrames : EFault::EmptyLineInRows;
+    for (size_t i = 0; i < m_uiEmptyLines; ++i)
+        m_kFindings.Add(fault, m_uiFirstEmptyLine + i);
+    m_uiEmptyLines = 0;
+}
+
+// The last one may be left out; in any other place the frames behind it would come early.
+void CRowCheck::TellShortRow(bool isLast)
+{
+    if (m_uiShortLine == 0)
+        return;
+    if (isLast && m_uiRows > 1)
+        m_kFindings.Add(EFault::ShortRow, m_uiShortLine);
+    else
+        m_kFindings.AddUnmended(EFault::ShortRow, m_uiShortLine);
+    m_kPlan.dropsLast = isLast && m_uiRows > 1;
+    m_uiShortLine = 0;
+}
+
+void CRowCheck::ReadRow(std::string_view row, size_t line)
+{
+    std::string points;
+    if (HasDecimalCommas(row, m_kOutline.columnCount))
+    {
+        m_kFindings.Add(EFault::DecimalComma, line);
+        points = WithPoints(row);
+        row = points;
+    }
+    const size_t count = ReadValues(row);
+    const bool whole = count >= m_kOutline.columnCount;
+    TellBadTokens(whole, line);
+    if (count > m_kOutline.columnCount)
+        m_kFindings.Add(EFault::LongRow, line);
+    if (whole)
+        m_kTable.Append(m_kRow, line);
+    else
+        m_uiShortLine = line;
+}
+
+// As many values as there are columns; answers how many there are in the text.
+size_t CRowCheck::ReadValues(std::string_view row)
+{
+    m_kRow.clear();
+    m_kBadTokens.clear();
+    const char* text = row.data();
+    const char* const end = text + row.size();
+    for (;;)
+    {
+        text = std::find_if_not(text, end, IsSeparator);
+        if (text == end)
+            return m_kRow.size();
+        if (m_kRow.size() == m_kOutline.columnCount)
+            return m_kRow.size() + CountTokens({text, end});
+        ENumber kind;
+        const char* next;
+        m_kRow.push_back(ReadFloat(text, end, next, kind));
+        if (kind != ENumber::Whole)
+        {
+            next = std::find_if(text, end, IsSeparator);
+            JudgeToken({text, next}, m_kRow.size() - 1);
+        }
+        text = next;
+    }
+}
+
+void CRowCheck::JudgeToken(std::string_view token, size_t column)
+{
+    const EFault fault = FaultOfNumber(token).value_or(EFault::StuckNumber);
+    m_kBadTokens.push_back({column, token, fault});
+    if (fault == EFault::NaN)
+        m_kRow[column] = std::nanf("");
+}
+
+// A NaN in a row that is whole waits for the rows behind it.
+void CRowCheck::TellBadTokens(bool whole, size_t line)
+{
+    const auto row = static_cast<uint32_t>(m_kTable.RowCount());
+    for (const BadToken& token : m_kBadTokens)
+    {
+        if (whole && token.fault == EFault::NaN)
+            m_kBadCells.push_back({row, static_cast<uint32_t>(token.column)});
+        else
+            m_kFindings.AddUnmended(token.fault, line, Quote(token.text));
+    }
+}
+
+void CRowCheck::CompareCounts()
+{
+    TellShortRow(true);
+    const auto promised = static_cast<size_t>(std::max(m_kOutline.frameCount, 0));
+    m_kPlan.rowCount = m_uiRows - m_kPlan.dropsLast;
+    m_kPlan.correctsCount = m_uiRows > 0 && m_kPlan.rowCount != promised;
+    if (m_uiRows == 0 && promised == 0)
+        m_kFindings.Add(EFault::NoFrames, m_kOutline.framesLine);
+    else if (m_uiRows == 0)
+        m_kFindings.AddUnmended(EFault::MissingRows, m_kOutline.framesLine);
+    else if (m_uiRows != promised)
+        m_kFindings.Add(m_uiRows < promised ? EFault::MissingRows : EFault::SurplusRows,
+                        m_kOutline.framesLine);
+}
+
+void CRowCheck::MendCells()
+{
+    std::vector<float> values(m_kBadCells.size());
+    for (size_t i = 0; i < values.size(); ++i)
+    {
+        const size_t line = m_kTable.LineOf(m_kBadCells[i].row);
+        if (MeanOfNeighbours(m_kBadCells[i], values[i]))
+            m_kFindings.Add(EFault::NaN, line);
+        else
+            m_kFindings.AddUnmended(EFault::NaN, line);
+    }
+    for (size_t i = 0; i < values.size(); ++i)
+    {
+        if (std::isfinite(values[i]))
+            m_kTable.Mend(m_kBadCells[i].row, m_kBadCells[i].column, values[i]);
+    }
+}
+
+// The value between those of the nearest frames that have one; at the beginning and the end the only one.
+// False, with a NaN, where the gap is too long for that.
+bool CRowCheck::MeanOfNeighbours(const BadCell& cell, float& value) const
+{
+    size_t before = cell.row;
+    size_t behind = cell.row;
+    const auto isGap = [&](size_t row) { return std::isnan(m_kTable.At(row, cell.column)); };
+    while (before > 0 && behind - before <= kLongestGap && isGap(before))
+        --before;
+    while (behind + 1 < m_kTable.RowCount() && behind - before <= kLongestGap + 1 && isGap(behind))
+        ++behind;
+    const float first = m_kTable.At(isGap(before) ? behind : before, cell.column);
+    const float last = m_kTable.At(isGap(behind) ? before : behind, cell.column);
+    value = first;
+    if (isGap(before) == isGap(behind))
+    {
+        const float turned = IsRotation(cell.column) ? NearestTurn(last, first) : last;
+        const auto share = static_cast<float>(cell.row - before) / static_cast<float>(behind - before);
+        value = first + (turned - first) * share;
+    }
+    if (behind - before > kLongestGap + 1)
+        value = std::nanf("");
+    return std::isfinite(value);
+}
+
+bool CRowCheck::IsRotation(size_t column) const
+{
+    const auto isBehind = [](size_t at, const OutlineJoint& joint) { return at < joint.firstColumn; };
+    const auto joint =
+        std::prev(std::upper_bound(m_kOutline.joints.begin(), m_kOutline.joints.end(), column, isBehind));
+    const size_t index = column - joint->firstColumn;
+    return index < joint->channels.size() && joint->channels[index] >= kFirstRotation &&
+           joint->channels[index] < kFirstScale;
+}
+
+} // namespace gw

@@ -1,0 +1,106 @@
+#include "CRowMender.h"
+
+#include "BVHOutline.h"
+#include "CLineCursor.h"
+#include "CSafeFile.h"
+#include "NumberText.h"
+#include "Numbers.h"
+#include "Text.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kWriteBytes = size_t{1} << 20;
+
+size_t CountTokens(std::string_view text)
+{
+    size_t count = 0;
+    while (!NextToken(text).empty())
+        ++count;
+    return count;
+}
+
+} // namespace
+
+bool CRowMender::Write(std::string_view text, CSafeFile& file)
+{
+    CLineCursor lines(text, m_kOutline.rowsBegin, m_kOutline.rowsLine);
+    const size_t rows = m_kPlan.rowCount + m_kPlan.dropsLast;
+    for (size_t row = 0; row < rows && lines.Next();)
+    {
+        if (lines.IsBlank() || ++row > m_kPlan.rowCount)
+            continue;
+        AppendRow(lines.Line());
+        const size_t end = lines.OffsetOf(lines.Line()) + lines.Line().size();
+        m_kOut += text.substr(end, lines.NextOffset() - end);
+        if (m_kOut.size() < kWriteBytes)
+            continue;
+        if (!file.Write(m_kOut))
+            return false;
+        m_kOut.clear();
+    }
+    return file.Write(m_kOut) && file.Write(text.substr(lines.NextOffset()));
+}
+
+void CRowMender::AppendRow(std::string_view row)
+{
+    std::string points;
+    if (HasDecimalCommas(row, m_kOutline.columnCount))
+    {
+        points = WithPoints(row);
+        row = points;
+    }
+    const bool whole = CountTokens(row) >= m_kOutline.columnCount;
+    if (whole && Changes())
+        AppendValues(row);
+    else
+        m_kOut += row;
+    m_uiWhole += whole;
+}
+
+bool CRowMender::IsCellOf(size_t column) const
+{
+    return IsCellOfRow() && m_kCells[m_uiNextCell].column == column;
+}
+
+bool CRowMender::IsCellOfRow() const
+{
+    return m_uiNextCell < m_kCells.size() && m_kCells[m_uiNextCell].row == m_uiWhole;
+}
+
+bool CRowMender::Changes() const
+{
+    return !m_kPlan.subtrahends.empty() || IsCellOfRow();
+}
+
+void CRowMender::AppendValues(std::string_view row)
+{
+    const char* at = row.data();
+    std::string_view rest = row;
+    for (size_t column = 0; column < m_kOutline.columnCount; ++column)
+    {
+        const std::string_view token = NextToken(rest);
+        m_kOut.append(at, token.data()); // the blanks as they are
+        AppendValue(token, column);
+        at = token.data() + token.size();
+    }
+    m_kOut += rest;
+}
+
+void CRowMender::AppendValue(std::string_view token, size_t column)
+{
+    const float less = m_kPlan.subtrahends.empty() ? 0.0f : m_kPlan.subtrahends[column];
+    const bool mended = IsCellOf(column);
+    double value = ParseDouble(token);
+    while (IsCellOf(column)) // mended twice, the later value counts
+        value = static_cast<double>(m_kCells[m_uiNextCell++].value);
+    if (mended || (less != 0.0f && !FaultOfNumber(token)))
+        AppendFixed6(m_kOut, static_cast<float>(value - static_cast<double>(less)));
+    else
+        m_kOut += token;
+}
+
+} // namespace gw

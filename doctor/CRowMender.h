@@ -1,0 +1,47 @@
+#pragma once
+
+#include "CRowCheck.h"
+#include "CRowTable.h"
+
+#include <cstddef>
+#include <string>
+#include <string_view>
+#include <utility>
+#include <vector>
+
+namespace gw {
+
+class CLineCursor;
+class CSafeFile;
+struct BVHOutline;
+
+/// Writes the rows of a motion again as a plan of the check wants them. A value that nobody changes stays as
+/// it is written, and so do line ends and what stands behind the rows.
+class CRowMender
+{
+public:
+    CRowMender(const BVHOutline& outline, const RowPlan& plan, std::vector<MendedCell> cells)
+        : m_kOutline(outline), m_kPlan(plan), m_kCells(std::move(cells))
+    {
+    }
+
+    /// Writes from the beginning of the rows to the end of the text. False when the file takes it not.
+    bool Write(std::string_view text, CSafeFile& file);
+
+private:
+    void AppendRow(std::string_view row);
+    void AppendValues(std::string_view row);
+    void AppendValue(std::string_view token, size_t column);
+    bool Changes() const;
+    bool IsCellOfRow() const;
+    bool IsCellOf(size_t column) const;
+
+    const BVHOutline& m_kOutline;
+    const RowPlan& m_kPlan;
+    std::vector<MendedCell> m_kCells; // in the order of the rows
+    size_t m_uiNextCell = 0;
+    size_t m_uiWhole = 0; // rows so far that are whole, as the cells count them
+    std::string m_kOut;
+};
+
+} // namespace gw

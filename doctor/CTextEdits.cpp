@@ -1,0 +1,31 @@
+#include "CTextEdits.h"
+
+#include "CSafeFile.h"
+
+#include <algorithm>
+
+namespace gw {
+
+void CTextEdits::Replace(size_t begin, size_t length, std::string_view instead)
+{
+    m_kEdits.push_back({begin, length, m_kInstead.size(), instead.size()});
+    m_kInstead += instead;
+}
+
+bool CTextEdits::Write(std::string_view text, CSafeFile& file)
+{
+    std::ranges::stable_sort(m_kEdits, {}, &Edit::begin);
+    const std::string_view insteads = m_kInstead;
+    std::string written;
+    size_t at = 0;
+    for (const Edit& edit : m_kEdits)
+    {
+        written += text.substr(at, edit.begin - at);
+        written += insteads.substr(edit.firstInstead, edit.insteadLength);
+        at = edit.begin + edit.length;
+    }
+    written += text.substr(at);
+    return file.Write(written);
+}
+
+} // namespace gw

@@ -1,0 +1,103 @@
+#include "CheckSpikes.h"
+
+#include "BVHOutline.h"
+#include "CFindings.h"
+#include "CRowTable.h"
+#include "CheckOffsets.h"
+#include "FindSpikes.h"
+#include "JointRows.h"
+#include "RotationTurns.h"
+
+#include <algorithm>
+#include <array>
+#include <cmath>
+#include <span>
+#include <string>
+
+namespace gw {
+
+namespace {
+
+constexpr double kLeastJumpShare = 0.1; // of the reach: 10 cm on a person
+constexpr float kMostTurn = 90.0f;      // degrees; angles further apart are two ways of saying one rotation
+
+class CSpikeCheck
+{
+public:
+    CSpikeCheck(const BVHOutline& outline, CRowTable& table, CFindings& findings)
+        : m_kOutline(outline), m_kTable(table), m_kFindings(findings)
+    {
+    }
+
+    void Run()
+    {
+        const double least = kLeastJumpShare * SkeletonReach(m_kOutline);
+        for (const OutlineJoint& joint : m_kOutline.joints)
+        {
+            const std::vector<size_t> rotations = RotationColumns(joint);
+            if (!rotations.empty())
+                Treat(joint, FindSpikes(RotationsOf(joint, m_kTable)), rotations);
+            std::array<size_t, 3> positions{};
+            if (PositionColumns(joint, positions) && least > 0.0)
+                Treat(joint, FindSpikes(PositionsIn(positions), least), positions);
+        }
+    }
+
+private:
+    std::vector<Vec3> PositionsIn(const std::array<size_t, 3>& columns) const
+    {
+        std::vector<Vec3> positions;
+        positions.reserve(m_kTable.RowCount());
+        for (size_t row = 0; row < m_kTable.RowCount(); ++row)
+            positions.push_back(PositionIn(m_kTable.Row(row), columns));
+        return positions;
+    }
+
+    void Treat(const OutlineJoint& joint, const std::vector<Spike>& spikes, std::span<const size_t> columns)
+    {
+        for (const Spike& spike : spikes)
+        {
+            const size_t line = m_kTable.LineOf(spike.first);
+            if (spike.count > 1)
+            {
+                m_kFindings.AddUnmended(EFault::Spike, line, joint.name);
+                continue;
+            }
+            m_kFindings.Add(EFault::Spike, line, joint.name);
+            Mend(joint, spike.first, columns);
+        }
+    }
+
+    // Where the angles on both sides say about the same, the pose lies between them; else the one before
+    // stays for a frame.
+    void Mend(const OutlineJoint& joint, size_t row, std::span<const size_t> columns)
+    {
+        const bool rotation = joint.channels[columns[0] - joint.firstColumn] >= 3;
+        const auto behind = [&](size_t column) {
+            const float before = m_kTable.At(row - 1, column);
+            const float value = m_kTable.At(row + 1, column);
+            return rotation ? NearestTurn(value, before) : value;
+        };
+        const bool near = std::ranges::all_of(columns, [&](size_t column) {
+            return !rotation || std::fabs(behind(column) - m_kTable.At(row - 1, column)) <= kMostTurn;
+        });
+        for (const size_t column : columns)
+        {
+            const float before = m_kTable.At(row - 1, column);
+            m_kTable.Mend(row, column, near ? before + 0.5f * (behind(column) - before) : before);
+        }
+    }
+
+    const BVHOutline& m_kOutline;
+    CRowTable& m_kTable;
+    CFindings& m_kFindings;
+};
+
+} // namespace
+
+void CheckSpikes(const BVHOutline& outline, CRowTable& table, CFindings& findings)
+{
+    CSpikeCheck(outline, table, findings).Run();
+}
+
+} // namespace gw

@@ -1,0 +1,112 @@
+// A marker that is mistaken for another one throws a joint out of its motion for a frame or two and lets it
+// come back to where it would have been. No body does that: a fast one that turns round is on its way before
+// and after. So three things must come together: the step out and the step back are large, the frames on
+// both sides fit to each other, and the steps around are small against both.
+
+#include "FindSpikes.h"
+
+#include "Angles.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kLongestSpike = 2;
+constexpr size_t kWindow = 4;          // steps on each side that tell the motion around
+constexpr size_t kLeastAround = 3;     // of them must be there for a verdict
+constexpr double kMostAcross = 0.25;   // from before to behind, as a share of the jump
+constexpr double kMostAround = 0.2;    // the largest step around, as a share of the jump
+constexpr double kLeastDegrees = 30.0; // twice what a fast limb turns in a frame of a usual rate
+
+double StepBetween(const Quat& a, const Quat& b)
+{
+    const double dot = static_cast<double>(a.w) * b.w + static_cast<double>(a.x) * b.x +
+                       static_cast<double>(a.y) * b.y + static_cast<double>(a.z) * b.z;
+    return 2.0 * std::acos(std::min(std::fabs(dot), 1.0));
+}
+
+double StepBetween(const Vec3& a, const Vec3& b)
+{
+    return Vec3Length(a - b);
+}
+
+template <class Key>
+class CSpikeSearch
+{
+public:
+    CSpikeSearch(std::span<const Key> keys, double least) : m_kKeys(keys), m_fLeast(least)
+    {
+        m_kSteps.reserve(keys.size());
+        for (size_t i = 0; i + 1 < keys.size(); ++i)
+            m_kSteps.push_back(static_cast<float>(StepBetween(keys[i], keys[i + 1])));
+    }
+
+    std::vector<Spike> Run() const
+    {
+        std::vector<Spike> spikes;
+        for (size_t first = 1; first + 1 < m_kKeys.size(); ++first)
+        {
+            const size_t count = LengthOfSpike(first);
+            if (count == 0)
+                continue;
+            spikes.push_back({first, count});
+            first += count;
+        }
+        return spikes;
+    }
+
+private:
+    size_t LengthOfSpike(size_t first) const
+    {
+        if (!(m_kSteps[first - 1] >= m_fLeast))
+            return 0;
+        for (size_t count = 1; count <= kLongestSpike && first + count < m_kKeys.size(); ++count)
+        {
+            if (IsSpike(first, count))
+                return count;
+        }
+        return 0;
+    }
+    bool IsSpike(size_t first, size_t count) const
+    {
+        const size_t behind = first + count;
+        const double jump = static_cast<double>(std::min(m_kSteps[first - 1], m_kSteps[behind - 1]));
+        const double across = StepBetween(m_kKeys[first - 1], m_kKeys[behind]);
+        return jump >= m_fLeast && across <= kMostAcross * jump && IsQuietAround(first, count, jump);
+    }
+    bool IsQuietAround(size_t first, size_t count, double jump) const
+    {
+        const size_t out = first - 1; // the steps out and back
+        const size_t back = first + count - 1;
+        const size_t begin = out - std::min(out, kWindow);
+        const size_t end = std::min(back + 1 + kWindow, m_kSteps.size());
+        const auto isQuiet = [=, this](size_t from, size_t to) {
+            return std::all_of(m_kSteps.begin() + static_cast<std::ptrdiff_t>(from),
+                               m_kSteps.begin() + static_cast<std::ptrdiff_t>(to),
+                               [=](float step) { return static_cast<double>(step) <= kMostAround * jump; });
+        };
+        return (out - begin) + (end - back - 1) >= kLeastAround && isQuiet(begin, out) &&
+               isQuiet(back + 1, end);
+    }
+
+    std::span<const Key> m_kKeys;
+    double m_fLeast;
+    std::vector<float> m_kSteps; // from each frame to the next
+};
+
+} // namespace
+
+std::vector<Spike> FindSpikes(std::span<const Quat> rotations)
+{
+    return CSpikeSearch(rotations, kLeastDegrees * kDegreesToRadians64).Run();
+}
+
+std::vector<Spike> FindSpikes(std::span<const Vec3> positions, double least)
+{
+    return CSpikeSearch(positions, least).Run();
+}
+
+} // namespace gw

@@ -1,0 +1,24 @@
+#pragma once
+
+#include "Quat.h"
+#include "Vec3.h"
+
+#include <cstddef>
+#include <span>
+#include <vector>
+
+namespace gw {
+
+/// Frames in which a joint has jumped out of its motion; the frame behind them is back in it.
+struct Spike
+{
+    size_t first; ///< frame
+    size_t count; ///< 1 or 2
+};
+
+/// Spikes of a joint's rotations: at least 30 degrees out and back, and far beyond the motion around.
+std::vector<Spike> FindSpikes(std::span<const Quat> rotations);
+/// Spikes of a joint's positions that go at least `least` out, in their unit.
+std::vector<Spike> FindSpikes(std::span<const Vec3> positions, double least);
+
+} // namespace gw

@@ -1,0 +1,72 @@
+#include "JointRows.h"
+
+#include "Angles.h"
+#include "AxisRotation.h"
+#include "BVHOutline.h"
+#include "CRowTable.h"
+#include "TKBVHFile.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+bool IsRotation(int channel)
+{
+    return channel >= kFirstRotation && channel < kFirstScale;
+}
+
+Quat RotationIn(const OutlineJoint& joint, std::span<const float> row)
+{
+    Mat3 rotation = kMat3Identity;
+    for (size_t i = 0; i < joint.channels.size(); ++i)
+    {
+        if (IsRotation(joint.channels[i]))
+            RotateRows(rotation, static_cast<size_t>(joint.channels[i] - kFirstRotation),
+                       row[joint.firstColumn + i] * kDegreesToRadians);
+    }
+    return QuatFromMat3(rotation);
+}
+
+} // namespace
+
+bool PositionColumns(const OutlineJoint& joint, std::array<size_t, 3>& columns)
+{
+    for (int axis = 0; axis < 3; ++axis)
+    {
+        const auto found = std::ranges::find(joint.channels, axis);
+        if (found == joint.channels.end())
+            return false;
+        columns[static_cast<size_t>(axis)] =
+            joint.firstColumn + static_cast<size_t>(found - joint.channels.begin());
+    }
+    return true;
+}
+
+Vec3 PositionIn(std::span<const float> row, const std::array<size_t, 3>& columns)
+{
+    return {row[columns[0]], row[columns[1]], row[columns[2]]};
+}
+
+std::vector<size_t> RotationColumns(const OutlineJoint& joint)
+{
+    std::vector<size_t> columns;
+    for (size_t i = 0; i < joint.channels.size(); ++i)
+    {
+        if (IsRotation(joint.channels[i]))
+            columns.push_back(joint.firstColumn + i);
+    }
+    return columns;
+}
+
+std::vector<Quat> RotationsOf(const OutlineJoint& joint, const CRowTable& table)
+{
+    std::vector<Quat> rotations;
+    rotations.reserve(table.RowCount());
+    for (size_t row = 0; row < table.RowCount(); ++row)
+        rotations.push_back(RotationIn(joint, table.Row(row)));
+    return rotations;
+}
+
+} // namespace gw
