@@ -21,10 +21,11 @@ class CLineCursor;
 class CBVHExam
 {
 public:
+    explicit CBVHExam(CFindings& findings) : m_kFindings(findings) {}
+
     /// Reads the whole text. None on success, else why there is none to examine.
     EFailure Examine(const std::string& path);
 
-    const CFindings& Findings() const { return m_kFindings; }
 
     /// Writes the text with all mendable faults gone. False when the file cannot be written; the old one
     /// stands then.
@@ -36,7 +37,7 @@ private:
     CMappedFile m_kFile;
     std::string m_kClean; // the text, where bytes of the file had to go
     std::string_view m_kText;
-    CFindings m_kFindings;
+    CFindings& m_kFindings;
     CTextEdits m_kEdits;
     BVHOutline m_kOutline;
     RowPlan m_kPlan;

@@ -4,6 +4,7 @@
 
 #include "CheckOffsets.h"
 
+#include "AlongAxis.h"
 #include "BVHOutline.h"
 #include "CFindings.h"
 #include "CRowTable.h"

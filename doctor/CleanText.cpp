@@ -150,9 +150,14 @@ private:
 
 } // namespace
 
+bool IsLfsPointer(std::string_view text)
+{
+    return text.starts_with(kLfsBeginning);
+}
+
 std::string_view CleanText(std::string_view text, std::string& clean, CFindings& findings)
 {
-    if (text.starts_with(kLfsBeginning))
+    if (IsLfsPointer(text))
     {
         findings.Add(EFault::LfsPointer, 1);
         return {};

@@ -7,6 +7,9 @@ namespace gw {
 
 class CFindings;
 
+/// Whether a file is a pointer of Git LFS, which stands where the file itself was not fetched.
+bool IsLfsPointer(std::string_view text);
+
 /// The text of a motion file without what belongs into none: byte order mark, control characters, blanks and
 /// signs of typesetting, carriage returns without a line feed (which end a line after this). Each is a
 /// finding. Answers the text itself where it is clean, else `clean`, which then holds it. Where the bytes are

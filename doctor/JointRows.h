@@ -13,12 +13,6 @@ namespace gw {
 class CRowTable;
 struct OutlineJoint;
 
-/// The component of a vector along X (0), Y (1) or Z (2).
-inline float AlongAxis(const Vec3& v, size_t axis)
-{
-    return axis == 0 ? v.x : axis == 1 ? v.y : v.z;
-}
-
 /// The columns of a joint's X, Y and Z position in a row. False for a joint that lacks one of them.
 bool PositionColumns(const OutlineJoint& joint, std::array<size_t, 3>& columns);
 /// What those columns hold in a row.

@@ -1,0 +1,52 @@
+#include "CFileExam.h"
+
+#include "CFailure.h"
+#include "CMappedFile.h"
+#include "CMotionFile.h"
+#include "CheckPoses.h"
+#include "CleanText.h"
+
+namespace gw {
+
+namespace {
+
+bool IsPointer(const std::string& path)
+{
+    CMappedFile file;
+    return file.Open(path) == EFailure::None && IsLfsPointer(file.Text());
+}
+
+} // namespace
+
+void CFileExam::ExamineBVH(const std::string& path)
+{
+    m_spText = std::make_unique<CBVHExam>(m_kFindings);
+    if (const EFailure failure = m_spText->Examine(path); failure != EFailure::None)
+        return m_kFindings.AddReader({failure, 0, {}}, ESeverity::Error);
+    CMotionFile motion;
+    if (motion.Load(path))
+        return ExaminePoses(motion);
+    // What the text is said to have wrong is what the reader tripped over.
+    if (!m_kFindings.HasErrors())
+        m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
+}
+
+void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record)
+{
+    if (record.Failure() && IsPointer(path))
+        return m_kFindings.Add(EFault::LfsPointer, 1);
+    if (record.Failure())
+        m_kFindings.AddReader(record.Failure(), ESeverity::Error);
+    for (const CFailure& warning : record.Warnings())
+    {
+        if (warning.reason != EFailure::RestPose) // one of the facts
+            m_kFindings.AddReader(warning, ESeverity::Warning);
+    }
+}
+
+void CFileExam::ExaminePoses(const CMotionFile& motion)
+{
+    m_kFacts = CheckPoses(motion, m_kFindings);
+}
+
+} // namespace gw

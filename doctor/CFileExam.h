@@ -1,0 +1,40 @@
+#pragma once
+
+#include "CBVHExam.h"
+#include "CFindings.h"
+#include "MotionFacts.h"
+
+#include <memory>
+#include <optional>
+#include <string>
+
+namespace gw {
+
+class CFailureRecord;
+class CMotionFile;
+
+/// The examination of one file: what is wrong with it, and what there is to know of its motion.
+class CFileExam
+{
+public:
+    /// Examines a BVH file: its text line by line, and its poses where a reader takes it.
+    void ExamineBVH(const std::string& path);
+    /// Takes over what the reader of any other file said.
+    void TakeRecord(const std::string& path, const CFailureRecord& record);
+    /// Looks at the poses of a motion that was read.
+    void ExaminePoses(const CMotionFile& motion);
+
+    const CFindings& Findings() const { return m_kFindings; }
+    /// Nothing where no motion was read.
+    const std::optional<MotionFacts>& Facts() const { return m_kFacts; }
+
+    /// Writes a BVH file again with all mendable faults gone. False when it cannot be written.
+    bool WriteMended(const std::string& path) { return m_spText && m_spText->WriteMended(path); }
+
+private:
+    CFindings m_kFindings;
+    std::optional<MotionFacts> m_kFacts;
+    std::unique_ptr<CBVHExam> m_spText; // for a mended copy
+};
+
+} // namespace gw

@@ -1,0 +1,15 @@
+#pragma once
+
+#include "MotionFacts.h"
+
+namespace gw {
+
+class CFindings;
+class CMotionFile;
+
+/// What can be told of a motion only when it moves: a root that stands still, a rate that does not go with
+/// the steps, sides that are swapped. Answers what is known of it beside. The motion must be loaded; leaves
+/// its tree posed.
+MotionFacts CheckPoses(const CMotionFile& motion, CFindings& findings);
+
+} // namespace gw
