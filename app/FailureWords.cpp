@@ -120,6 +120,11 @@ std::string_view FailureCode(EFailure reason)
     return RowOf(kFailures, reason).m_kCode;
 }
 
+std::string_view FailureRemedy(EFailure reason)
+{
+    return RowOf(kFailures, reason).m_kRemedy;
+}
+
 CReport MakeReport(const std::string& path, const CFailure& failure, bool warning)
 {
     CReport report = ReportOf(RowOf(kFailures, failure.reason), path, failure.name);

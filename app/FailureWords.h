@@ -21,6 +21,9 @@ enum class EMisfit : uint8_t
 /// The short fixed word for a reason.
 std::string_view FailureCode(EFailure reason);
 
+/// What can be done about it; empty where nothing is known.
+std::string_view FailureRemedy(EFailure reason);
+
 /// A failure or warning of a file, in words: "walk.bvh:12: an empty line ...". Names are made safe to print.
 CReport MakeReport(const std::string& path, const CFailure& failure, bool warning);
 CReport MakeReport(const std::string& path, EMisfit misfit, const std::string& name = {});

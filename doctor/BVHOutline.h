@@ -31,12 +31,11 @@ struct BVHOutline
     std::vector<OutlineJoint> joints; ///< of the first root, in the order of the file
     size_t columnCount = 0;           ///< values that a row should have
 
-    bool hasRows = false; ///< the head of the motion was understood, so that rows may follow
     int32_t frameCount = 0;
     size_t framesLine = 0;
     size_t framesBegin = 0;  ///< where the number of frames stands in the text
     size_t framesLength = 0; ///< bytes of it
-    double frameSeconds = 0.0;
+    size_t frameTimeLine = 0;
     size_t rowsBegin = 0; ///< where the rows begin in the text
     size_t rowsLine = 1;  ///< and the line of that
 };

@@ -1,8 +1,8 @@
 #include "BodyPaths.h"
 
+#include "AlongAxis.h"
 #include "CMotionFile.h"
 #include "CPoseSampler.h"
-#include "AlongAxis.h"
 
 #include <algorithm>
 #include <cmath>

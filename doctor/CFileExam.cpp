@@ -25,9 +25,9 @@ void CFileExam::ExamineBVH(const std::string& path)
         return m_kFindings.AddReader({failure, 0, {}}, ESeverity::Error);
     CMotionFile motion;
     if (motion.Load(path))
-        return ExaminePoses(motion);
+        m_kFacts = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
     // What the text is said to have wrong is what the reader tripped over.
-    if (!m_kFindings.HasErrors())
+    else if (!m_kFindings.HasErrors())
         m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
 }
 
@@ -46,7 +46,7 @@ void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record
 
 void CFileExam::ExaminePoses(const CMotionFile& motion)
 {
-    m_kFacts = CheckPoses(motion, m_kFindings);
+    m_kFacts = CheckPoses(motion, nullptr, m_kFindings);
 }
 
 } // namespace gw

@@ -21,7 +21,7 @@ public:
     void ExamineBVH(const std::string& path);
     /// Takes over what the reader of any other file said.
     void TakeRecord(const std::string& path, const CFailureRecord& record);
-    /// Looks at the poses of a motion that was read.
+    /// Looks at the poses of a motion that was read from another file.
     void ExaminePoses(const CMotionFile& motion);
 
     const CFindings& Findings() const { return m_kFindings; }

@@ -264,7 +264,7 @@ void CHierarchyCheck::LookForMixedChannels()
     {
         std::vector<int> rotations = joint.channels;
         std::erase_if(rotations, [](int channel) { return channel < kFirstRotation; });
-        if (rotations.empty())
+        if (rotations.empty() || std::ranges::count(joint.channels, OutlineJoint::kNoChannel) > 0)
             continue;
         if (usual.empty())
             usual = rotations;

@@ -115,8 +115,8 @@ bool CMotionHeadCheck::ReadFrameTime(BVHOutline& outline)
         m_kEdits.Replace(m_kLines.OffsetOf(value), value.size(), points);
         value = points;
     }
-    outline.frameSeconds = ParseDouble(NextToken(value));
-    if (outline.frameSeconds >= kLongestFrame)
+    outline.frameTimeLine = m_kLines.Number();
+    if (ParseDouble(NextToken(value)) >= kLongestFrame)
         m_kFindings.Add(EFault::RateForTime, m_kLines.Number());
     return true;
 }

@@ -1,9 +1,12 @@
 #include "CheckPoses.h"
 
+#include "BVHOutline.h"
 #include "BodyPaths.h"
 #include "CFindings.h"
 #include "CKeyframeControl.h"
 #include "CMotionFile.h"
+#include "CheckBody.h"
+#include "FindBody.h"
 #include "FindBodyByNames.h"
 #include "GaitRate.h"
 #include "Skeleton.h"
@@ -56,57 +59,110 @@ double LongestBone(const std::vector<CNode*>& nodes)
     return longest;
 }
 
-void CheckRoot(CNode& root, CFindings& findings)
+class CPoseCheck
 {
-    const CKeyframeControl* const track = TrackOf(root);
-    if (!track || !StandsStill(*track))
-        return;
-    const double least = kLeastTravelShare * LongestBone(NodesOf(root));
-    for (size_t i = 0; i < root.GetChildCount(); ++i)
+public:
+    CPoseCheck(CNode& root, const BVHOutline* outline, CFindings& findings)
+        : m_kRoot(root), m_pkOutline(outline), m_kFindings(findings)
     {
-        const CNode* const child = RecordCast<CNode>(root.ChildAt(i));
-        const CKeyframeControl* const below = child ? TrackOf(*child) : nullptr;
-        if (below && least > 0.0 && Travel(*below) >= least)
-            return findings.Add(EFault::StillRoot, 0, std::string(root.NameView()));
     }
-}
 
-// "declared 24 a second, rather 120"
-std::string RateWords(double declared, double usual)
-{
-    return "declared " + std::to_string(std::lround(declared)) + " a second, rather " +
-           std::to_string(std::lround(usual));
-}
+    void CheckRoot()
+    {
+        const CKeyframeControl* const track = TrackOf(m_kRoot);
+        if (!track || !StandsStill(*track))
+            return;
+        const double least = kLeastTravelShare * LongestBone(NodesOf(m_kRoot));
+        for (size_t i = 0; i < m_kRoot.GetChildCount(); ++i)
+        {
+            const CNode* const child = RecordCast<CNode>(m_kRoot.ChildAt(i));
+            const CKeyframeControl* const below = child ? TrackOf(*child) : nullptr;
+            if (below && least > 0.0 && Travel(*below) >= least)
+                return Add(EFault::StillRoot, m_kRoot);
+        }
+    }
 
-void CheckRate(const BodyPaths& paths, const UpAxis& up, const MotionFacts& facts, CFindings& findings)
+    // What the names say of left and right, against the places of the legs or arms.
+    void CheckSides()
+    {
+        const CBodyMap named = FindBodyByNames(m_kRoot);
+        const std::vector<BodyDoubt> doubts = CheckBody(named);
+        const auto doubt = std::ranges::find(doubts, EBodyDoubt::SidesSwapped, &BodyDoubt::kind);
+        const CNode* const joint = doubt == doubts.end() ? nullptr : JointAt(named, doubt->place);
+        if (joint)
+            Add(EFault::SidesSwapped, *joint);
+    }
+
+    // A rate in place of a time needs no gait to be seen.
+    void CheckRate(const BodyPaths& paths, const UpAxis& up, const MotionFacts& facts)
+    {
+        const std::optional<Gait> gait = FindGait(paths, up, facts.leg);
+        const double rate = 1.0 / facts.frameSeconds;
+        if (!gait || !std::isfinite(rate) || !IsOtherRate(*gait, rate) ||
+            m_kFindings.Has(EFault::RateForTime))
+            return;
+        m_kFindings.Add(EFault::WrongRate, m_pkOutline ? m_pkOutline->frameTimeLine : 0,
+                        RateWords(rate, gait->UsualRate()));
+    }
+
+private:
+    void Add(EFault fault, const CNode& node)
+    {
+        m_kFindings.Add(fault, LineOf(node), std::string(node.NameView()));
+    }
+    size_t LineOf(const CNode& node) const
+    {
+        if (!m_pkOutline)
+            return 0;
+        const auto joint = std::ranges::find(m_pkOutline->joints, node.NameView(), &OutlineJoint::name);
+        return joint == m_pkOutline->joints.end() ? 0 : joint->line;
+    }
+    // "declared 24 a second, rather 120"
+    static std::string RateWords(double declared, double usual)
+    {
+        return "declared " + std::to_string(std::lround(declared)) + " a second, rather " +
+               std::to_string(std::lround(usual));
+    }
+
+    CNode& m_kRoot;
+    const BVHOutline* m_pkOutline;
+    CFindings& m_kFindings;
+};
+
+EBodySource SourceOf(const FoundBody& found)
 {
-    const std::optional<Gait> gait = FindGait(paths, up, facts.leg);
-    const double rate = 1.0 / facts.frameSeconds;
-    if (gait && std::isfinite(rate) && IsOtherRate(*gait, rate))
-        findings.Add(EFault::WrongRate, 0, RateWords(rate, gait->UsualRate()));
+    if (!found.body.DrivesBody())
+        return EBodySource::None;
+    const auto isNamed = [](EBodyEvidence evidence) { return evidence >= EBodyEvidence::Name; };
+    const auto isThere = [](EBodyEvidence evidence) { return evidence != EBodyEvidence::None; };
+    const auto named = std::ranges::count_if(found.evidence, isNamed);
+    return 2 * named > std::ranges::count_if(found.evidence, isThere) ? EBodySource::Names
+                                                                      : EBodySource::Shape;
 }
 
 } // namespace
 
-MotionFacts CheckPoses(const CMotionFile& motion, CFindings& findings)
+MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFindings& findings)
 {
     CNode& root = *motion.motionRoot;
-    CheckRoot(root, findings);
-    const CBodyMap body = FindBodyByNames(root);
+    CPoseCheck check(root, outline, findings);
+    check.CheckRoot();
+    check.CheckSides();
+    const FoundBody found = FindBody(root);
     MotionFacts facts;
     facts.jointCount = NodesOf(root).size();
-    facts.frameCount = motion.GetKeyCount();
+    facts.frameCount = static_cast<size_t>(motion.GetKeyCount());
     facts.frameSeconds = static_cast<double>(motion.GetFrequency());
-    facts.body = body.DrivesBody() ? EBodySource::Names : EBodySource::None;
-    facts.leg = LegLength(body);
+    facts.body = SourceOf(found);
+    facts.leg = LegLength(found.body);
     facts.unit = UnitOfLeg(facts.leg);
-    facts.restPose = RestPoseOf(body);
-    const BodyPaths paths = FollowBody(motion, body);
+    facts.restPose = RestPoseOf(found.body);
+    const BodyPaths paths = FollowBody(motion, found.body);
     if (paths.FrameCount() == 0)
         return facts;
     const UpAxis up = FindUpAxis(paths);
     facts.up = kUpNames[up.negative][up.axis];
-    CheckRate(paths, up, facts, findings);
+    check.CheckRate(paths, up, facts);
     return facts;
 }
 

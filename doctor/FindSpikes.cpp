@@ -1,7 +1,8 @@
 // A marker that is mistaken for another one throws a joint out of its motion for a frame or two and lets it
 // come back to where it would have been. No body does that: a fast one that turns round is on its way before
-// and after. So three things must come together: the step out and the step back are large, the frames on
-// both sides fit to each other, and the steps around are small against both.
+// and after. So three things must come together: the step out and the step back are large, the steps around
+// are small against both, and the frames on both sides fit to each other: they are apart by what the motion
+// around does in that time, or by little.
 
 #include "FindSpikes.h"
 
@@ -18,6 +19,7 @@ constexpr size_t kLongestSpike = 2;
 constexpr size_t kWindow = 4;          // steps on each side that tell the motion around
 constexpr size_t kLeastAround = 3;     // of them must be there for a verdict
 constexpr double kMostAcross = 0.25;   // from before to behind, as a share of the jump
+constexpr double kMostHaste = 1.5;     // or by the steps around
 constexpr double kMostAround = 0.2;    // the largest step around, as a share of the jump
 constexpr double kLeastDegrees = 30.0; // twice what a fast limb turns in a frame of a usual rate
 
@@ -74,22 +76,23 @@ private:
     {
         const size_t behind = first + count;
         const double jump = static_cast<double>(std::min(m_kSteps[first - 1], m_kSteps[behind - 1]));
+        const double around = LargestStepAround(first - 1, behind - 1);
+        if (jump < m_fLeast || around < 0.0 || around > kMostAround * jump)
+            return false;
         const double across = StepBetween(m_kKeys[first - 1], m_kKeys[behind]);
-        return jump >= m_fLeast && across <= kMostAcross * jump && IsQuietAround(first, count, jump);
+        return across <= std::max(kMostAcross * jump, kMostHaste * around * static_cast<double>(count + 1));
     }
-    bool IsQuietAround(size_t first, size_t count, double jump) const
+    // Of the steps before the one out and behind the one back; below 0 where there are too few for a verdict.
+    double LargestStepAround(size_t out, size_t back) const
     {
-        const size_t out = first - 1; // the steps out and back
-        const size_t back = first + count - 1;
         const size_t begin = out - std::min(out, kWindow);
         const size_t end = std::min(back + 1 + kWindow, m_kSteps.size());
-        const auto isQuiet = [=, this](size_t from, size_t to) {
-            return std::all_of(m_kSteps.begin() + static_cast<std::ptrdiff_t>(from),
-                               m_kSteps.begin() + static_cast<std::ptrdiff_t>(to),
-                               [=](float step) { return static_cast<double>(step) <= kMostAround * jump; });
-        };
-        return (out - begin) + (end - back - 1) >= kLeastAround && isQuiet(begin, out) &&
-               isQuiet(back + 1, end);
+        if ((out - begin) + (end - back - 1) < kLeastAround)
+            return -1.0;
+        float largest = 0.0f;
+        for (size_t step = begin; step < end; ++step)
+            largest = step >= out && step <= back ? largest : std::max(largest, m_kSteps[step]);
+        return static_cast<double>(largest);
     }
 
     std::span<const Key> m_kKeys;

@@ -8,8 +8,8 @@
 
 #include "GaitRate.h"
 
-#include "BodyPaths.h"
 #include "AlongAxis.h"
+#include "BodyPaths.h"
 
 #include <algorithm>
 #include <cmath>

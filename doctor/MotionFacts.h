@@ -2,6 +2,7 @@
 
 #include "CBodyMap.h"
 
+#include <cstddef>
 #include <cstdint>
 #include <string_view>
 
@@ -32,7 +33,7 @@ enum class EBodySource : uint8_t
 struct MotionFacts
 {
     size_t jointCount = 0;
-    int frameCount = 0;
+    size_t frameCount = 0;
     double frameSeconds = 0.0;
     double leg = 0.0;      ///< thigh and shin in units of the file; 0 where they are not known
     std::string_view unit; ///< what the leg's length makes of the unit; empty where it fits none

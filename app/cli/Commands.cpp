@@ -51,6 +51,13 @@ constexpr CCommand kCommands[] = {
         "Take the motion file out of a Kinetra file.", "gaitwright extract walk.Kinetra -o walk.htr"),
     Row("package", "IN OUT", kRate | kForce, kRate, RunPackage, "Wrap a motion file into a Kinetra file.",
         "gaitwright package walk.htr walk.Kinetra --rate 30"),
+    Row("doctor", "FILE...", kFix | kForce, 0, RunDoctor,
+        "Say what is wrong with motion files, where, and what to do about it.\n"
+        "A line for each fault, as FILE:LINE: CODE: WORDS, and one of facts for each file: rate, units, the\n"
+        "way up, the rest pose, how the body was found. Exit code 1 where a fault was found.\n"
+        "With --fix a copy of one .bvh is written with all faults gone that can be mended without changing\n"
+        "the motion; it is examined in turn, and the exit code is that of the copy.",
+        "gaitwright doctor walk.bvh --fix mended.bvh"),
     Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
         "List the installed profiles; with a source, which fit and what the others miss.",
         "gaitwright profiles walk.bvh"),

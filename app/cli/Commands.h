@@ -72,5 +72,6 @@ EExit RunSuggest(const COptions& options);
 EExit RunCompare(const COptions& options);
 EExit RunDump(const COptions& options);
 EExit RunRender(const COptions& options);
+EExit RunDoctor(const COptions& options);
 
 } // namespace gw

@@ -29,6 +29,7 @@ constexpr COptionRow kOptions[] = {
     Row(kStrip, "--strip", "N", &COptions::strip, "N poses in a row; two motions one under the other"),
     Row(kRate, "--rate", "R", &COptions::rate, "frames per second, as the package tells its reader"),
     Row(kFrameScale, "--frame-scale", "F", &COptions::frameScale, "F times as many frames in the same time"),
+    Row(kFix, "--fix", "OUT", &COptions::fix, "write a mended copy of the .bvh, never over itself"),
     Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's stand"),
     Row(kForce, "--force", "", &COptions::force, "replace a file that exists"),
     Row(kSkipExisting, "--skip-existing", "", &COptions::skipExisting,
