@@ -25,6 +25,8 @@ public:
 
     /// Reads the whole text. None on success, else why there is none to examine.
     EFailure Examine(const std::string& path);
+    /// Gives back the memory of the text, which is read again where it is needed.
+    void Forget() { m_kFile.Forget(m_kFile.Text().size()); }
     /// What the text says before its rows.
     const BVHOutline& Outline() const { return m_kOutline; }
     /// Writes the text with all mendable faults gone. False when the file cannot be written; the old one

@@ -23,12 +23,19 @@ void CFileExam::ExamineBVH(const std::string& path)
     m_spText = std::make_unique<CBVHExam>(m_kFindings);
     if (const EFailure failure = m_spText->Examine(path); failure != EFailure::None)
         return m_kFindings.AddReader({failure, 0, {}}, ESeverity::Error);
+    m_spText->Forget();
     CMotionFile motion;
     if (motion.Load(path))
         m_kFacts = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
     // What the text is said to have wrong is what the reader tripped over.
     else if (!m_kFindings.HasErrors())
         m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
+}
+
+bool CFileExam::WriteMended(const std::string& path)
+{
+    const std::unique_ptr<CBVHExam> text = std::move(m_spText);
+    return text && text->WriteMended(path);
 }
 
 void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record)

@@ -28,8 +28,9 @@ public:
     /// Nothing where no motion was read.
     const std::optional<MotionFacts>& Facts() const { return m_kFacts; }
 
-    /// Writes a BVH file again with all mendable faults gone. False when it cannot be written.
-    bool WriteMended(const std::string& path) { return m_spText && m_spText->WriteMended(path); }
+    /// Writes a BVH file again with all mendable faults gone, once: its text is given back after that. False
+    /// when it cannot be written.
+    bool WriteMended(const std::string& path);
 
 private:
     CFindings m_kFindings;

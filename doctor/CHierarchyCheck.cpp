@@ -18,15 +18,25 @@ namespace gw {
 
 namespace {
 
+// The token at the front of a text, without taking it off.
+std::string_view FirstToken(std::string_view text)
+{
+    return NextToken(text);
+}
+
 bool IsBrace(std::string_view token)
 {
     return token == "{" || token == "}";
 }
 
-// The token at the front of a text, without taking it off.
-std::string_view FirstToken(std::string_view text)
+// Whether a part of a line ends before this: before a brace with nothing, another one or a keyword behind it.
+bool IsBraceAhead(std::string_view rest)
 {
-    return NextToken(text);
+    if (!IsBrace(NextToken(rest)))
+        return false;
+    const std::string_view behind = FirstToken(rest);
+    constexpr std::string_view kBehind[] = {"", "{", "}", "OFFSET", "CHANNELS", "JOINT", "End", "ROOT"};
+    return std::ranges::any_of(kBehind, [=](std::string_view word) { return EqualNoCase(word, behind); });
 }
 
 // The part of a line up to the next brace, or the brace where it comes first, without blanks around it.
@@ -34,7 +44,7 @@ std::string_view NextPart(std::string_view& rest)
 {
     std::string_view token = NextToken(rest);
     std::string_view part = token;
-    while (!token.empty() && !IsBrace(token) && !IsBrace(FirstToken(rest)))
+    while (!token.empty() && !IsBrace(part) && !IsBraceAhead(rest))
     {
         token = NextToken(rest);
         if (!token.empty())
@@ -64,6 +74,7 @@ const CHierarchyCheck::KeywordRow CHierarchyCheck::kKeywords[] = {
     {"ROOT",      &CHierarchyCheck::OpenRoot      },
     {"JOINT",     &CHierarchyCheck::OpenJoint     },
     {"End",       &CHierarchyCheck::OpenEndSite   },
+    {"{",         &CHierarchyCheck::OpenBlock     },
     {"}",         &CHierarchyCheck::CloseBlock    },
     {"OFFSET",    &CHierarchyCheck::ReadOffset    },
     {"CHANNELS",  &CHierarchyCheck::ReadChannels  },
@@ -75,6 +86,7 @@ bool CHierarchyCheck::Read(BVHOutline& outline)
     // The reader refuses more joints than it has room for; until then they stay in proportion to the file.
     while (!m_bMotion && m_kJoints.size() <= kBoneLimit && m_kLines.Next())
         ReadLine();
+    PartLines();
     LookForSameNames();
     LookForMixedChannels();
     PlanColumns(outline);
@@ -87,16 +99,29 @@ void CHierarchyCheck::ReadLine()
 {
     std::string_view rest = m_kLines.Line();
     bool first = true;
-    bool shared = false;
     for (std::string_view part = NextPart(rest); !part.empty(); part = NextPart(rest), first = false)
     {
-        if (!first && m_bHierarchy)
-        {
-            if (!std::exchange(shared, true))
-                m_kFindings.Add(EFault::BraceOnLine, m_kLines.Number());
-            m_kEdits.Replace(m_kLines.OffsetOf(part), 0, "\n");
-        }
+        if (!first && m_bHierarchy && m_kShared.size() < CTextEdits::kMost)
+            m_kShared.push_back({m_kLines.Number(), m_kLines.OffsetOf(part)});
         ReadWords(part);
+    }
+}
+
+// Only where all blocks are closed after that: else the braces are not what they seem.
+void CHierarchyCheck::PartLines()
+{
+    const bool closed = m_bBracesFit && m_kOpen.empty();
+    size_t told = 0;
+    for (const auto& [line, offset] : m_kShared)
+    {
+        if (closed)
+            m_kEdits.Replace(offset, 0, "\n");
+        if (std::exchange(told, line) == line)
+            continue;
+        if (closed)
+            m_kFindings.Add(EFault::BraceOnLine, line);
+        else
+            m_kFindings.AddUnmended(EFault::BraceOnLine, line);
     }
 }
 
@@ -126,7 +151,7 @@ void CHierarchyCheck::OpenRoot(std::string_view name)
     if (++m_uiRoots > 1)
     {
         m_kFindings.Add(EFault::SecondRoot, m_kLines.Number(), Quote(FirstToken(name)));
-        return m_kOpen.push_back(OutlineJoint::kNoParent);
+        return m_kOpen.push_back({OutlineJoint::kNoParent});
     }
     Add(name, OutlineJoint::kNoParent);
 }
@@ -134,15 +159,15 @@ void CHierarchyCheck::OpenRoot(std::string_view name)
 // A joint outside all blocks belongs to the root; one in a block that is not read is not read either.
 void CHierarchyCheck::OpenJoint(std::string_view name)
 {
-    const size_t parent = m_kOpen.empty() ? 0 : m_kOpen.back();
+    const size_t parent = m_kOpen.empty() ? 0 : m_kOpen.back().joint;
     if (m_kJoints.empty() || parent == OutlineJoint::kNoParent)
-        return m_kOpen.push_back(OutlineJoint::kNoParent);
+        return m_kOpen.push_back({OutlineJoint::kNoParent});
     Add(name, parent);
 }
 
 void CHierarchyCheck::Add(std::string_view name, size_t parent)
 {
-    m_kOpen.push_back(m_kJoints.size());
+    m_kOpen.push_back({m_kJoints.size()});
     OutlineJoint joint;
     joint.parent = parent;
     joint.line = m_kLines.Number();
@@ -170,16 +195,24 @@ std::string CHierarchyCheck::ReadName(std::string_view name)
     return joined;
 }
 
+void CHierarchyCheck::OpenBlock(std::string_view)
+{
+    m_bBracesFit = m_bBracesFit && !m_kOpen.empty() && !m_kOpen.back().braced;
+    if (!m_kOpen.empty())
+        m_kOpen.back().braced = true;
+}
+
 void CHierarchyCheck::CloseBlock(std::string_view)
 {
+    m_bBracesFit = m_bBracesFit && !m_kOpen.empty() && m_kOpen.back().braced;
     if (!m_kOpen.empty())
         m_kOpen.pop_back();
 }
 
 OutlineJoint* CHierarchyCheck::Joint()
 {
-    const bool none = m_kOpen.empty() || m_kOpen.back() == OutlineJoint::kNoParent;
-    return none ? nullptr : &m_kJoints[m_kOpen.back()];
+    const bool none = m_kOpen.empty() || m_kOpen.back().joint == OutlineJoint::kNoParent;
+    return none ? nullptr : &m_kJoints[m_kOpen.back().joint];
 }
 
 void CHierarchyCheck::ReadOffset(std::string_view numbers)

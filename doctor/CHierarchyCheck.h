@@ -28,15 +28,27 @@ public:
 
 private:
     struct KeywordRow;
+    struct Block
+    {
+        size_t joint; // kNoParent where it makes none
+        bool braced = false;
+    };
+    struct SharedLine
+    {
+        size_t line;
+        size_t offset; // of the words that want a line of their own
+    };
     static const KeywordRow kKeywords[];
 
     void ReadLine();
+    void PartLines();
     void ReadWords(std::string_view words);
     void BeginHierarchy(std::string_view) { m_bHierarchy = true; }
     void BeginMotion(std::string_view) { m_bMotion = m_bHierarchy; }
     void OpenRoot(std::string_view name);
     void OpenJoint(std::string_view name);
-    void OpenEndSite(std::string_view) { m_kOpen.push_back(OutlineJoint::kNoParent); }
+    void OpenEndSite(std::string_view) { m_kOpen.push_back({OutlineJoint::kNoParent}); }
+    void OpenBlock(std::string_view);
     void CloseBlock(std::string_view);
     void ReadOffset(std::string_view numbers);
     void ReadChannels(std::string_view rest);
@@ -54,7 +66,9 @@ private:
     CFindings& m_kFindings;
     CTextEdits& m_kEdits;
     std::vector<OutlineJoint> m_kJoints;
-    std::vector<size_t> m_kOpen; // joints whose blocks are open, kNoParent for those that make none
+    std::vector<Block> m_kOpen;
+    std::vector<SharedLine> m_kShared;
+    bool m_bBracesFit = true;
     size_t m_uiRoots = 0;
     bool m_bHierarchy = false;
     bool m_bMotion = false;

@@ -8,13 +8,14 @@ namespace gw {
 
 void CRowTable::Append(std::span<const float> values, size_t line)
 {
-    m_kValues.insert(m_kValues.end(), values.begin(), values.end());
+    for (size_t column = 0; column < values.size(); ++column)
+        m_kColumns[column].push_back(values[column]);
     m_kLines.push_back(static_cast<uint32_t>(line));
 }
 
 void CRowTable::Mend(size_t row, size_t column, float value)
 {
-    m_kValues[row * m_uiColumns + column] = value;
+    m_kColumns[column][row] = value;
     m_kMended.push_back({static_cast<uint32_t>(row), static_cast<uint32_t>(column), value});
 }
 

@@ -8,6 +8,16 @@ namespace gw {
 
 void CTextEdits::Replace(size_t begin, size_t length, std::string_view instead)
 {
+    const bool goesOn = !m_kEdits.empty() && instead.empty() && m_kEdits.back().insteadLength == 0 &&
+                        m_kEdits.back().begin + m_kEdits.back().length == begin;
+    if (goesOn)
+        m_kEdits.back().length += length;
+    else if (m_kEdits.size() < kMost)
+        Add(begin, length, instead);
+}
+
+void CTextEdits::Add(size_t begin, size_t length, std::string_view instead)
+{
     m_kEdits.push_back({begin, length, m_kInstead.size(), instead.size()});
     m_kInstead += instead;
 }

@@ -68,7 +68,7 @@ public:
     }
 
 private:
-    Vec3 At(size_t row) const { return PositionIn(m_kTable.Row(row), m_kColumns); }
+    Vec3 At(size_t row) const { return PositionIn(m_kTable, row, m_kColumns); }
 
     const OutlineJoint& m_kJoint;
     const CRowTable& m_kTable;

@@ -35,7 +35,7 @@ public:
         for (const OutlineJoint& joint : m_kOutline.joints)
         {
             const std::vector<size_t> rotations = RotationColumns(joint);
-            if (!rotations.empty())
+            if (MayJump(rotations))
                 Treat(joint, FindSpikes(RotationsOf(joint, m_kTable)), rotations);
             std::array<size_t, 3> positions{};
             if (PositionColumns(joint, positions) && least > 0.0)
@@ -44,12 +44,25 @@ public:
     }
 
 private:
+    // No rotation turns by more than its angles do together, and angles are quickly compared.
+    bool MayJump(const std::vector<size_t>& columns) const
+    {
+        for (size_t row = 1; row < m_kTable.RowCount(); ++row)
+        {
+            float turn = 0.0f;
+            for (const size_t column : columns)
+                turn += std::fabs(m_kTable.At(row, column) - m_kTable.At(row - 1, column));
+            if (turn >= static_cast<float>(kLeastSpikeDegrees))
+                return true;
+        }
+        return false;
+    }
     std::vector<Vec3> PositionsIn(const std::array<size_t, 3>& columns) const
     {
         std::vector<Vec3> positions;
         positions.reserve(m_kTable.RowCount());
         for (size_t row = 0; row < m_kTable.RowCount(); ++row)
-            positions.push_back(PositionIn(m_kTable.Row(row), columns));
+            positions.push_back(PositionIn(m_kTable, row, columns));
         return positions;
     }
 

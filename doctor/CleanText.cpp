@@ -70,7 +70,8 @@ class CCleaner
 {
 public:
     CCleaner(std::string_view text, std::string& clean, CFindings& findings)
-        : m_kRest(text), m_kText(text), m_kClean(clean), m_kFindings(findings)
+        : m_kRest(text), m_kText(text), m_kClean(clean), m_kFindings(findings),
+          m_bLineFeeds(text.find('\n') != text.npos)
     {
     }
 
@@ -106,12 +107,14 @@ private:
             return Keep(1);
         Replace(EFault::StrayCharacter, stray->bytes.size(), stray->instead, stray->what);
     }
-    // Before a whole line end it came from a file that was changed twice.
+    // Where no line feed is in the whole text, lines end so. Else it is a blank at best, and before a whole
+    // line end it came from changing line ends twice.
     void JudgeReturn()
     {
         if (m_kRest.starts_with("\r\n"))
             return Keep(2);
-        Replace(EFault::CarriageReturn, 1, m_kRest.starts_with("\r\r\n") ? "" : "\n", "");
+        const bool again = m_kRest.starts_with("\r\r\n");
+        Replace(EFault::CarriageReturn, 1, m_bLineFeeds ? (again ? "" : " ") : "\n", "");
     }
     void JudgeControl()
     {
@@ -144,6 +147,7 @@ private:
     std::string_view m_kText;
     std::string& m_kClean;
     CFindings& m_kFindings;
+    bool m_bLineFeeds;
     size_t m_uiLine = 1;
     bool m_bChanged = false;
 };

@@ -16,12 +16,11 @@ namespace gw {
 namespace {
 
 constexpr size_t kLongestSpike = 2;
-constexpr size_t kWindow = 4;          // steps on each side that tell the motion around
-constexpr size_t kLeastAround = 3;     // of them must be there for a verdict
-constexpr double kMostAcross = 0.25;   // from before to behind, as a share of the jump
-constexpr double kMostHaste = 1.5;     // or by the steps around
-constexpr double kMostAround = 0.2;    // the largest step around, as a share of the jump
-constexpr double kLeastDegrees = 30.0; // twice what a fast limb turns in a frame of a usual rate
+constexpr size_t kWindow = 4;        // steps on each side that tell the motion around
+constexpr size_t kLeastAround = 3;   // of them must be there for a verdict
+constexpr double kMostAcross = 0.25; // from before to behind, as a share of the jump
+constexpr double kMostHaste = 1.5;   // or by the steps around
+constexpr double kMostAround = 0.2;  // the largest step around, as a share of the jump
 
 double StepBetween(const Quat& a, const Quat& b)
 {
@@ -104,7 +103,7 @@ private:
 
 std::vector<Spike> FindSpikes(std::span<const Quat> rotations)
 {
-    return CSpikeSearch(rotations, kLeastDegrees * kDegreesToRadians64).Run();
+    return CSpikeSearch(rotations, kLeastSpikeDegrees * kDegreesToRadians64).Run();
 }
 
 std::vector<Spike> FindSpikes(std::span<const Vec3> positions, double least)

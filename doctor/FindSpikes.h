@@ -16,7 +16,10 @@ struct Spike
     size_t count; ///< 1 or 2
 };
 
-/// Spikes of a joint's rotations: at least 30 degrees out and back, and far beyond the motion around.
+/// The least turn of a spike: twice what a fast limb turns in a frame of a usual rate.
+inline constexpr double kLeastSpikeDegrees = 30.0;
+
+/// Spikes of a joint's rotations: at least kLeastSpikeDegrees out and back, and far beyond the motion around.
 std::vector<Spike> FindSpikes(std::span<const Quat> rotations);
 /// Spikes of a joint's positions that go at least `least` out, in their unit.
 std::vector<Spike> FindSpikes(std::span<const Vec3> positions, double least);

@@ -17,14 +17,14 @@ bool IsRotation(int channel)
     return channel >= kFirstRotation && channel < kFirstScale;
 }
 
-Quat RotationIn(const OutlineJoint& joint, std::span<const float> row)
+Quat RotationIn(const OutlineJoint& joint, const CRowTable& table, size_t row)
 {
     Mat3 rotation = kMat3Identity;
     for (size_t i = 0; i < joint.channels.size(); ++i)
     {
         if (IsRotation(joint.channels[i]))
             RotateRows(rotation, static_cast<size_t>(joint.channels[i] - kFirstRotation),
-                       row[joint.firstColumn + i] * kDegreesToRadians);
+                       table.At(row, joint.firstColumn + i) * kDegreesToRadians);
     }
     return QuatFromMat3(rotation);
 }
@@ -44,9 +44,9 @@ bool PositionColumns(const OutlineJoint& joint, std::array<size_t, 3>& columns)
     return true;
 }
 
-Vec3 PositionIn(std::span<const float> row, const std::array<size_t, 3>& columns)
+Vec3 PositionIn(const CRowTable& table, size_t row, const std::array<size_t, 3>& columns)
 {
-    return {row[columns[0]], row[columns[1]], row[columns[2]]};
+    return {table.At(row, columns[0]), table.At(row, columns[1]), table.At(row, columns[2])};
 }
 
 std::vector<size_t> RotationColumns(const OutlineJoint& joint)
@@ -65,7 +65,7 @@ std::vector<Quat> RotationsOf(const OutlineJoint& joint, const CRowTable& table)
     std::vector<Quat> rotations;
     rotations.reserve(table.RowCount());
     for (size_t row = 0; row < table.RowCount(); ++row)
-        rotations.push_back(RotationIn(joint, table.Row(row)));
+        rotations.push_back(RotationIn(joint, table, row));
     return rotations;
 }
 

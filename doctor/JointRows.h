@@ -5,7 +5,6 @@
 
 #include <array>
 #include <cstddef>
-#include <span>
 #include <vector>
 
 namespace gw {
@@ -16,7 +15,7 @@ struct OutlineJoint;
 /// The columns of a joint's X, Y and Z position in a row. False for a joint that lacks one of them.
 bool PositionColumns(const OutlineJoint& joint, std::array<size_t, 3>& columns);
 /// What those columns hold in a row.
-Vec3 PositionIn(std::span<const float> row, const std::array<size_t, 3>& columns);
+Vec3 PositionIn(const CRowTable& table, size_t row, const std::array<size_t, 3>& columns);
 /// The columns of a joint's rotations.
 std::vector<size_t> RotationColumns(const OutlineJoint& joint);
 /// The joint's rotation in each row.

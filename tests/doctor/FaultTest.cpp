@@ -72,6 +72,11 @@ FaultCase Stays(const char* what, const Change& change, const char* code, size_t
     return {EEnd::Stays, what, change, code, line};
 }
 
+std::string ReturnForBlank(const std::string& row)
+{
+    return Replaced(row, " ", "\r");
+}
+
 std::string Pointer(const std::string&)
 {
     return "version https://git-lfs.example/spec/v1\noid sha256:4d7a\nsize 12345\n";
@@ -111,7 +116,7 @@ std::vector<FaultCase> Cases()
         Stays("a pointer in place of the file", Pointer, "lfs-pointer", 1),
         Stays("16 bits a character", Wide, "not-text", 0),
         Restored("a byte order mark", Around("\xef\xbb\xbf", ""), "byte-order-mark", 1),
-        Restored("a lone carriage return", Replace("\n", "\r", "Frames:"), "carriage-return", frames),
+        Restored("a carriage return in a row", ChangeRow(kFrame, ReturnForBlank), "carriage-return", row),
         Mended("a line end that was doubled", Replace("\n", "\r\r\n", "Frames:"), "carriage-return", frames),
         Restored("a zero byte", Replace("OFFSET 9", "OFFSET\0009"sv), "stray-character", 8),
         Restored("a no-break space", Replace("OFFSET 9", "OFFSET\302\2409"), "stray-character", 8),
@@ -226,6 +231,14 @@ TEST(Faults, OfValuesAreMendedByTheirNeighbours)
     for (int frame = kFrame; frame < kFrame + 4; ++frame)
         long4 = GiveValue(frame, kThighX, "nan")(long4);
     EXPECT_FALSE(CExamined(long4).Exam().Findings().MendsAny());
+}
+
+TEST(Faults, OfLineEndsAreMended)
+{
+    const std::string walk = MadeWalk();
+    CExamined old(AllReplaced(walk, "\n", "\r"));
+    EXPECT_TRUE(old.Found().starts_with("1 carriage-return, 2 carriage-return")) << old.Found();
+    EXPECT_TRUE(old.Mended() == walk);
 }
 
 TEST(Faults, OfDecimalCommasAreMended)

@@ -1,0 +1,134 @@
+// Whatever bytes a file has: an answer, and never a healthy one where the reader does not take it.
+
+#include "CMotionFile.h"
+#include "Examined.h"
+#include "MadeWalk.h"
+#include "Paths.h"
+
+#include <algorithm>
+#include <gtest/gtest.h>
+#include <random>
+
+namespace gw {
+namespace {
+
+std::string ShortWalk()
+{
+    WalkStyle style;
+    style.frames = 6;
+    return MadeWalk(style);
+}
+
+// What the reader says of a file and what the examination does must not contradict each other.
+void ExpectConsistent(const std::string& text)
+{
+    CExamined examined(text);
+    const CFindings& findings = examined.Exam().Findings();
+    CMotionFile motion;
+    const bool loads = motion.Load(examined.Path());
+    EXPECT_EQ(loads, examined.Exam().Facts().has_value());
+    EXPECT_TRUE(loads || findings.HasErrors());
+    for (const CFailure& warning : motion.Record().Warnings())
+        EXPECT_TRUE(findings.HasFaults() || warning.reason == EFailure::RestPose);
+    if (!findings.MendsAny())
+        return;
+    CExamined copy(examined.Mended());
+    EXPECT_TRUE(copy.Loads() || copy.Exam().Findings().HasErrors());
+    EXPECT_TRUE(copy.Loads() || !loads) << examined.Found() << " -> " << copy.Found();
+}
+
+TEST(DamagedFiles, CutAnywhereAreNoHealthyOnes)
+{
+    const std::string walk = ShortWalk();
+    const std::string head = walk.substr(0, walk.find(LineOf(walk, LineOfFrame(walk, 1))));
+    for (size_t length = 0; length < head.size();
+         length += length < 40 || length + 400 > head.size() ? 1 : 11)
+    {
+        SCOPED_TRACE(length);
+        CExamined cut(walk.substr(0, length));
+        EXPECT_TRUE(cut.Exam().Findings().HasErrors());
+        EXPECT_FALSE(cut.Loads());
+    }
+}
+
+TEST(DamagedFiles, WithBytesChangedAreAnswered)
+{
+    const std::string walk = ShortWalk();
+    constexpr std::string_view kBytes{"\0\n\r\t ,.-+{}0eE#\xff\xc2\xa0n", 19};
+    std::mt19937 random(7);
+    for (int round = 0; round < 300; ++round)
+    {
+        SCOPED_TRACE(round);
+        std::string text = walk;
+        for (int change = 0; change < 1 + round % 4; ++change)
+        {
+            const size_t at = random() % text.size();
+            if (round % 3 == 0)
+                text.erase(at, 1 + random() % 40);
+            else
+                text[at] = kBytes[random() % kBytes.size()];
+        }
+        ExpectConsistent(text);
+    }
+}
+
+TEST(DamagedFiles, ThatHoldNoMotionAreTold)
+{
+    const struct
+    {
+        const char* what;
+        std::string text;
+        const char* found;
+    } rows[] = {
+        {"nothing",      "",                    "0 reader"                            },
+        {"another text", "solid cube\nfacet\n", "2 reader"                            },
+        {"bytes",        std::string(300,       '\x01'),                                "0 not-text"},
+        {"a motion without hierarchy",              "MOTION\nFrames: 1\n0 0 0\n",        "1 reader"    },
+        {"a hierarchy without joints",              "HIERARCHY\nMOTION\nFrames: 1\n",        "2 reader"},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CExamined examined(row.text);
+        EXPECT_EQ(examined.Found(), row.found);
+        EXPECT_TRUE(examined.Exam().Findings().HasErrors());
+    }
+    CFileExam missing;
+    missing.ExamineBVH("no/such/file.bvh");
+    EXPECT_EQ(missing.Findings().Sorted().at(0).reason, EFailure::NotFound);
+}
+
+// Files of many programs, of which each finding was looked at. They are too large for this repository.
+TEST(RealFiles, HaveTheFaultsThatTheyHave)
+{
+    const struct
+    {
+        const char* name;
+        const char* faults;
+    } rows[] = {
+        {"bandai_walk_normal_002.bvh", "12 doubled-offset"                                                   },
+        {"cmu_cgspeed_example.bvh",    "411 spike"                                                           }, // the right thumb is turned by 177 degrees for two frames
+        {"geno_stance.bvh",            "4 doubled-hip-offset, 8 doubled-offset"                              },
+        {"neuron_milad.bvh",           "4 doubled-hip-offset, 8 doubled-offset, 350 empty-line-before-frames"},
+        {"poser_boxing.bvh",           "4 doubled-hip-offset, 8 doubled-offset"                              },
+        {"poser_pose1.bvh",            "128 surplus-rows"                                                    },
+        {"pymo_walk_120hz.bvh",        "4 doubled-hip-offset"                                                },
+        {"rokoko_jesse_dance.bvh",     "4 doubled-hip-offset"                                                },
+        {"walk01_leftupleg.bvh",       "4 doubled-hip-offset"                                                },
+    };
+    const std::string folder = SharedDataFolder() + "bvh/";
+    for (const std::string& name : FilesInFolder(folder, ".bvh"))
+    {
+        SCOPED_TRACE(name);
+        const auto* const row =
+            std::ranges::find(rows, name, [](const auto& r) { return std::string(r.name); });
+        CExamined examined(ReadBytes(folder + name));
+        const bool healthy = !examined.Exam().Findings().HasFaults(); // notes are no faults
+        EXPECT_EQ(healthy ? "" : examined.Found(), row == std::end(rows) ? "" : row->faults);
+        const bool mends = examined.Exam().Findings().MendsAny();
+        EXPECT_FALSE(mends && CExamined(examined.Mended()).Exam().Findings().HasFaults());
+    }
+}
+
+} // namespace
+} // namespace gw
