@@ -5,6 +5,7 @@
 #include "CMotionHeadCheck.h"
 #include "CRowMender.h"
 #include "CSafeFile.h"
+#include "CheckJoints.h"
 #include "CheckOffsets.h"
 #include "CheckSpikes.h"
 #include "CleanText.h"
@@ -18,7 +19,9 @@ EFailure CBVHExam::Examine(const std::string& path)
         return failure;
     m_kText = CleanText(m_kFile.Text(), m_kClean, m_kFindings);
     CLineCursor lines(m_kText);
-    if (!CHierarchyCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline) || m_kOutline.joints.empty())
+    const bool hasMotion = CHierarchyCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline);
+    CheckJoints(m_kOutline, m_kFindings);
+    if (!hasMotion || m_kOutline.joints.empty())
         return EFailure::None;
     if (CMotionHeadCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline))
         ReadRows(lines);

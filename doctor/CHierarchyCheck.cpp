@@ -3,6 +3,7 @@
 #include "CFindings.h"
 #include "CTextEdits.h"
 #include "CTextLines.h"
+#include "LineParts.h"
 #include "MotionNode.h"
 #include "NumberText.h"
 #include "Numbers.h"
@@ -11,47 +12,11 @@
 #include <algorithm>
 #include <iterator>
 #include <string>
-#include <unordered_set>
 #include <utility>
 
 namespace gw {
 
 namespace {
-
-// The token at the front of a text, without taking it off.
-std::string_view FirstToken(std::string_view text)
-{
-    return NextToken(text);
-}
-
-bool IsBrace(std::string_view token)
-{
-    return token == "{" || token == "}";
-}
-
-// Whether a part of a line ends before this: before a brace with nothing, another one or a keyword behind it.
-bool IsBraceAhead(std::string_view rest)
-{
-    if (!IsBrace(NextToken(rest)))
-        return false;
-    const std::string_view behind = FirstToken(rest);
-    constexpr std::string_view kBehind[] = {"", "{", "}", "OFFSET", "CHANNELS", "JOINT", "End", "ROOT"};
-    return std::ranges::any_of(kBehind, [=](std::string_view word) { return EqualNoCase(word, behind); });
-}
-
-// The part of a line up to the next brace, or the brace where it comes first, without blanks around it.
-std::string_view NextPart(std::string_view& rest)
-{
-    std::string_view token = NextToken(rest);
-    std::string_view part = token;
-    while (!token.empty() && !IsBrace(part) && !IsBraceAhead(rest))
-    {
-        token = NextToken(rest);
-        if (!token.empty())
-            part = {part.data(), static_cast<size_t>(token.data() + token.size() - part.data())};
-    }
-    return part;
-}
 
 int ChannelOf(std::string_view word)
 {
@@ -87,8 +52,6 @@ bool CHierarchyCheck::Read(BVHOutline& outline)
     while (!m_bMotion && m_kJoints.size() <= kBoneLimit && m_kLines.Next())
         ReadLine();
     PartLines();
-    LookForSameNames();
-    LookForMixedChannels();
     PlanColumns(outline);
     outline.joints = std::move(m_kJoints);
     return m_bMotion;
@@ -150,7 +113,7 @@ void CHierarchyCheck::OpenRoot(std::string_view name)
 {
     if (++m_uiRoots > 1)
     {
-        m_kFindings.Add(EFault::SecondRoot, m_kLines.Number(), Quote(FirstToken(name)));
+        m_kFindings.Add(EFault::SecondRoot, m_kLines.Number(), Quote(NextToken(name)));
         return m_kOpen.push_back({OutlineJoint::kNoParent});
     }
     Add(name, OutlineJoint::kNoParent);
@@ -276,33 +239,6 @@ void CHierarchyCheck::PlanColumns(BVHOutline& outline)
         const size_t least = joint.parent == OutlineJoint::kNoParent ? 1 : 0;
         joint.firstColumn = outline.columnCount;
         outline.columnCount += std::max(joint.channels.size(), least);
-    }
-}
-
-void CHierarchyCheck::LookForSameNames()
-{
-    std::unordered_set<std::string_view> names;
-    for (const OutlineJoint& joint : m_kJoints)
-    {
-        if (!joint.name.empty() && !names.insert(joint.name).second)
-            m_kFindings.Add(EFault::SameName, joint.line, joint.name);
-    }
-}
-
-// Root and other joints may differ in positions; rotations that turn in different orders are what is told.
-void CHierarchyCheck::LookForMixedChannels()
-{
-    std::vector<int> usual;
-    for (const OutlineJoint& joint : m_kJoints)
-    {
-        std::vector<int> rotations = joint.channels;
-        std::erase_if(rotations, [](int channel) { return channel < kFirstRotation; });
-        if (rotations.empty() || std::ranges::count(joint.channels, OutlineJoint::kNoChannel) > 0)
-            continue;
-        if (usual.empty())
-            usual = rotations;
-        if (rotations != usual)
-            return m_kFindings.Add(EFault::MixedChannels, joint.line, joint.name);
     }
 }
 

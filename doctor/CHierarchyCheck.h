@@ -58,8 +58,6 @@ private:
     std::string ReadName(std::string_view name);
     void CheckSpelling(std::string_view word, std::string_view wanted);
     void PlanColumns(BVHOutline& outline);
-    void LookForSameNames();
-    void LookForMixedChannels();
     OutlineJoint* Joint();
 
     CLineCursor& m_kLines;

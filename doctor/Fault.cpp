@@ -91,8 +91,8 @@ constexpr FaultRow kFaults[] = {
          "map left to right, or export without mirroring"),
     Told(WrongRate, "wrong-rate", Warning, "the steps of this gait do not go with the rate",
          "correct the frame time"),
-    Told(MixedChannels, "mixed-channels", Note, "joints have channels of different kinds or orders",
-         "none is needed here; some other programs read one order only"),
+    Told(MixedChannels, "mixed-channels", Note, "the rotations of joints stand in different orders",
+         "nothing is to be done here; some programs read one order only"),
 };
 
 constexpr bool IsInOrder()
