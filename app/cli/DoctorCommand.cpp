@@ -37,15 +37,23 @@ void PrintLine(const std::string& line)
     std::printf("%s\n", line.c_str());
 }
 
-void Print(const COptions& options, const std::string& path, const CFileExam& exam)
+// Notes are among the facts.
+void PrintFaults(const std::string& path, const CFindings& findings)
 {
-    for (const Finding& finding : exam.Findings().Sorted())
+    for (const Finding& finding : findings.Sorted())
     {
-        if (finding.severity != ESeverity::Note || !options.quiet)
+        if (finding.severity != ESeverity::Note)
             PrintLine(FindingLine(path, finding));
     }
-    if (exam.Facts() && !options.quiet)
-        PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()));
+}
+
+void Print(const COptions& options, const std::string& path, const CFileExam& exam)
+{
+    PrintFaults(path, exam.Findings());
+    if (!exam.Facts() || options.quiet)
+        return;
+    const bool mixed = exam.Findings().Has(EFault::MixedChannels);
+    PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()) + (mixed ? ", rotation orders: mixed" : ""));
 }
 
 // `fixed` says whether a mended copy was written.
@@ -165,11 +173,7 @@ void TellFixed(const COptions& options, const CFileExam& exam, const CFileExam& 
     if (copy.Findings().HasFaults())
         line += ", but this is left";
     PrintLine(line);
-    for (const Finding& finding : copy.Findings().Sorted())
-    {
-        if (finding.severity != ESeverity::Note)
-            PrintLine(FindingLine(options.fix, finding));
-    }
+    PrintFaults(options.fix, copy.Findings());
 }
 
 // Only what the copy is like counts: whoever goes on takes that.

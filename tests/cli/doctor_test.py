@@ -25,6 +25,15 @@ class Doctor(CliTest):
         self.assertRegex(result.out, r"^[^\n]*walk\.bvh: \d+ joints, \d+ frames at [\d.]+ per second, legs of .*\n$")
         self.assertEqual(self.run_program("doctor", WALK, "--quiet").out, "")
 
+    def test_what_is_legal_is_a_fact_and_no_fault(self):
+        self.write("a.bvh", bvh("CHANNELS 3 Zrotation Xrotation", "CHANNELS 3 Xrotation Zrotation"))
+        result = self.run_program("doctor", "a.bvh")
+        self.assertEqual((result.code, result.out.count("\n")), (DONE, 1))
+        self.assertIn("rotation orders: mixed", result.out)
+        told = json.loads(self.run_program("doctor", "a.bvh", "--json").out)
+        self.assertTrue(told["healthy"])
+        self.assertEqual([(f["code"], f["severity"]) for f in told["findings"]], [("mixed-channels", "note")])
+
     def test_one_ill_file_of_several_counts(self):
         self.write("a.bvh", BVH)
         self.write("b.bvh", SHORT)
