@@ -1,0 +1,124 @@
+#include "CBodyPoses.h"
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CKeyframeControl.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kFrameCount = 6;
+// Cosines against the way up: legs that go down and arms that do not go up. Who stretches his arms over his
+// head at rest was put there by his file's frames.
+constexpr double kDown = -0.7;
+constexpr double kArmsUp = 0.7;
+
+const CKeyframeControl* TrackOf(const CNode& node)
+{
+    for (const CControl* control = node.GetControl(); control; control = control->GetNext())
+    {
+        if (const auto* track = RecordCast<const CKeyframeControl>(control))
+            return track;
+    }
+    return nullptr;
+}
+
+float FrameTimeOf(const CNode& node)
+{
+    const CKeyframeControl* const track = TrackOf(node);
+    return track ? track->m_fFrequency : 1.0f;
+}
+
+Vec3 Middle(const Vec3& a, const Vec3& b)
+{
+    return (a + b) * 0.5f;
+}
+
+} // namespace
+
+CBodyPoses::CBodyPoses(const CBodyMap& body)
+    : m_kBody(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
+{
+    for (const EBodySide side : kBodySides)
+    {
+        Watch(body.Arm(side).upperArm);
+        Watch(body.Leg(side).thigh);
+    }
+    if (!StandsAtRest())
+        PlanFrames();
+}
+
+CBodyPoses::~CBodyPoses()
+{
+    for (const Kept& kept : m_kKept)
+    {
+        kept.node->m_kMatrix = kept.local;
+        kept.node->m_kWorldMatrix = kept.world;
+    }
+}
+
+void CBodyPoses::Watch(CNode* node)
+{
+    m_kSampler.Watch(node);
+    for (; node && std::ranges::find(m_kKept, node, &Kept::node) == m_kKept.end();
+         node = node->GetParentNode())
+        m_kKept.push_back({node, node->m_kMatrix, node->m_kWorldMatrix});
+}
+
+void CBodyPoses::PlanFrames()
+{
+    const CKeyframeControl* const track = TrackOf(*m_kBody.Leg(EBodySide::Left).thigh);
+    const size_t count = track ? track->m_kKeyTimes.size() : 0;
+    for (size_t i = 0; i < std::min(count, kFrameCount); ++i)
+        m_kFrames.push_back(static_cast<double>(i * (count - 1) / std::max<size_t>(kFrameCount - 1, 1)));
+}
+
+void CBodyPoses::Take(size_t pose)
+{
+    if (!m_kFrames.empty())
+        m_kSampler.Pose(m_kFrames[pose]);
+}
+
+Mat4 CBodyPoses::World(const CNode& node) const
+{
+    return m_kFrames.empty() ? RestWorld(node) : node.m_kWorldMatrix;
+}
+
+Mat4 CBodyPoses::BoneWorld(const CNode& node) const
+{
+    const CBoneMesh* const mesh = FindBoneMesh(node);
+    return mesh ? mesh->m_kMatrix * World(node) : World(node);
+}
+
+Mat3 CBodyPoses::Axes() const
+{
+    const Vec3 left = Place(*m_kBody.Leg(EBodySide::Left).thigh);
+    const Vec3 right = Place(*m_kBody.Leg(EBodySide::Right).thigh);
+    const Vec3 arms = Middle(Place(*m_kBody.Arm(EBodySide::Left).upperArm),
+                             Place(*m_kBody.Arm(EBodySide::Right).upperArm));
+    const Vec3 up = Vec3Normalized(arms - Middle(left, right));
+    const Vec3 forward = Vec3Normalized(Vec3Cross(left - right, up));
+    Mat3 axes;
+    axes.SetRow(0, Vec3Cross(up, forward));
+    axes.SetRow(1, up);
+    axes.SetRow(2, forward);
+    return axes;
+}
+
+bool CBodyPoses::StandsAtRest() const
+{
+    const Vec3 up = Axes().Row(1);
+    const auto rise = [&](const CNode* from, const CNode* to) {
+        return from && to ? Vec3Dot(Vec3Normalized(Place(*to) - Place(*from)), up) : 0.0;
+    };
+    return std::ranges::all_of(kBodySides, [&](EBodySide side) {
+        const BodyArm& arm = m_kBody.Arm(side);
+        const BodyLeg& leg = m_kBody.Leg(side);
+        return rise(leg.thigh, leg.shin) < kDown && rise(arm.upperArm, arm.forearm) < kArmsUp;
+    });
+}
+
+} // namespace gw

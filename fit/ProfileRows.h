@@ -1,0 +1,42 @@
+#pragma once
+
+#include "CMapRowTable.h"
+#include "Vec3.h"
+
+#include <string>
+
+namespace gw {
+
+class CBoneNames;
+class CRetargeter;
+
+/// A profile as loading its file would leave it.
+struct ProfileRows
+{
+    std::string name; ///< display name
+    int frameRate = 30;
+    Vec3 position = kVec3Zero;
+    CMapRowTable rows; ///< with those of the pelvis bones
+};
+
+/// Reads a profile. False, and the record left alone, when the file cannot be read.
+bool ReadProfileRows(const std::string& path, ProfileRows& profile);
+/// The bytes of a file that reads as this profile.
+std::string TextOf(const ProfileRows& profile);
+
+/// How many rows there are, fixed ones included, and how many find their bones.
+struct RowMatch
+{
+    int rowCount = 0;
+    int foundCount = 0;
+    bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
+
+    /// Whether a conversion accepts the rows.
+    bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
+};
+
+/// Looks up the bones of all rows and tells a retargeter what those say whose bones are there.
+RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
+                   CRetargeter& table);
+
+} // namespace gw

@@ -1,0 +1,154 @@
+#include "RowTurns.h"
+
+#include "Angles.h"
+#include "BodyTree.h"
+#include "CBodyPoses.h"
+#include "CPoseMatcher.h"
+#include "CRetargeter.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+#include <optional>
+
+namespace gw {
+
+namespace {
+
+// Which bone a target bone leads to. The torso's two ends, the head and the feet carry several joints or none
+// and have no direction to swing to.
+struct LeadRow
+{
+    const char* bone;
+    const char* next; ///< null for none
+    bool isHand = false;
+};
+
+constexpr LeadRow kLeads[] = {
+    {"LowerTorso", nullptr    },
+    {"Waist",      "UpperTorso"},
+    {"UpperTorso", nullptr    },
+    {"Neck",       "Head"     },
+    {"Head",       nullptr    },
+    {"LCollar",    "LUpperArm"},
+    {"LUpperArm",  "LForearm" },
+    {"LForearm",   "LHand"    },
+    {"LHand",      nullptr,     true},
+    {"LFoot",      nullptr    },
+    {"RCollar",    "RUpperArm"},
+    {"RUpperArm",  "RForearm" },
+    {"RForearm",   "RHand"    },
+    {"RHand",      nullptr,     true},
+    {"RFoot",      nullptr    },
+};
+
+// A row of the table, with what its direction needs.
+struct Lead
+{
+    CNode* target;
+    CNode* source;
+    const CNode* from;        ///< the direction leads from here
+    std::vector<CNode*> next; ///< to the middle of these
+};
+
+// A hand without any goes on as the forearm does.
+void LeadToFingers(Lead& hand)
+{
+    hand.next = ChildNodes(*hand.source);
+    if (!hand.next.empty())
+        return;
+    hand.from = hand.source->GetParentNode();
+    if (hand.from)
+        hand.next = {hand.source};
+}
+
+std::vector<Lead> FindLeads(const CRetargeter& table, CNode& targetRoot)
+{
+    std::vector<Lead> leads;
+    for (const LeadRow& row : kLeads)
+    {
+        CNode* const target = FindNode(&targetRoot, row.bone);
+        CNode* const source = table.SourceOf(target);
+        if (!source)
+            continue;
+        leads.push_back({target, source, source, {}});
+        if (CNode* const next = row.next ? table.SourceOf(FindNode(&targetRoot, row.next)) : nullptr)
+            leads.back().next = {next};
+        if (row.isHand)
+            LeadToFingers(leads.back());
+    }
+    return leads;
+}
+
+// The shortest turn from one direction to another, as a matrix that multiplies rows from the right.
+Mat3 ShortestTurn(const Vec3& from, const Vec3& to)
+{
+    const Vec3 axis = Vec3Cross(from, to);
+    if (Vec3Length(axis) < 1e-6)
+        return Vec3Dot(from, to) > 0.0 ? kMat3Identity : Mat3FromAxisAngle(kVec3UnitZ, kPi);
+    return Mat3FromAxisAngle(Vec3Normalized(axis), static_cast<float>(SafeAcos(static_cast<float>(Vec3Dot(from, to)))));
+}
+
+double DegreesBetweenRotations(const Mat3& a, const Mat3& b)
+{
+    const Mat3 difference = a * Mat3Transpose(b);
+    const float trace = difference.m[0] + difference.m[4] + difference.m[8];
+    return SafeAcos((trace - 1.0f) / 2.0f) * kRadiansToDegrees64;
+}
+
+// Where the source's bone leads to in the body's own axes; nothing where joints coincide.
+std::optional<Vec3> Direction(const Lead& lead, const CBodyPoses& poses, const Mat3& toBody)
+{
+    Vec3 sum = kVec3Zero;
+    for (const CNode* node : lead.next)
+        sum = sum + (poses.Place(*node) - poses.Place(*lead.from));
+    const Vec3 direction = Vec3Normalized(sum);
+    if (direction == kVec3Zero)
+        return std::nullopt;
+    return TransformCoord(direction, Mat4Compose(toBody, kVec3Zero));
+}
+
+double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses)
+{
+    const Mat3 toBody = Mat3Transpose(poses.Axes());
+    const Mat3 offset = OffsetRotation(table.OffsetAngles(lead.target), table.OffsetMatrix(lead.target));
+    const Mat3 turned = offset * NormalizedRows(poses.BoneWorld(*lead.source)) * toBody;
+    // The target stands along the axes at rest: left is x, up is y.
+    Mat3 wanted = NormalizedRows(RestWorld(*lead.target));
+    if (const std::optional<Vec3> direction = Direction(lead, poses, toBody))
+        wanted = wanted * ShortestTurn(wanted.Row(1), *direction);
+    return DegreesBetweenRotations(turned, wanted);
+}
+
+bool HasLimbs(const CBodyMap& body)
+{
+    return std::ranges::all_of(kBodySides, [&](EBodySide side) {
+        return body.Arm(side).upperArm && body.Leg(side).thigh;
+    });
+}
+
+} // namespace
+
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body)
+{
+    if (!HasLimbs(body))
+        return {};
+    CBodyPoses poses(body);
+    const std::vector<Lead> leads = FindLeads(table, targetRoot);
+    std::vector<RowTurn> turns;
+    for (const Lead& lead : leads)
+    {
+        turns.push_back({lead.target, 0.0});
+        poses.Watch(lead.source);
+        for (CNode* node : lead.next)
+            poses.Watch(node);
+    }
+    for (size_t pose = 0; pose < poses.Count(); ++pose)
+    {
+        poses.Take(pose);
+        for (size_t i = 0; i < leads.size(); ++i)
+            turns[i].degrees += Turn(leads[i], table, poses) / static_cast<double>(poses.Count());
+    }
+    return turns;
+}
+
+} // namespace gw
