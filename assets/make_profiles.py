@@ -13,6 +13,13 @@ POSES = {
     "straight": FEET,
     # A spine that leans back and a neck that leans forward turn their frames by a quarter, whatever the angle.
     "curved": FEET | {"Waist": "0,0,0,3,2,-1", "Neck": "0,0,0,-3,2,1"},
+    # A spine that leans forward turns the other way.
+    "leaning": FEET | {"Waist": "0,0,0,-3,2,1", "Neck": "0,0,0,-3,2,1"},
+    # A middle foot behind the ankle.
+    "curved, heels": {"Waist": "0,0,0,3,2,-1", "Neck": "0,0,0,-3,2,1", "LFoot": "0,0,0,-3,2,1",
+                      "RFoot": "0,0,0,-3,2,1"},
+    # A straight spine under a neck that leans forward.
+    "bowed head": FEET | {"Neck": "0,0,0,-3,2,1", "Head": "0,0,0,-3,2,1"},
     # All bones along X in frames of their own: the right ones point back along it, or have their sides turned.
     "back along x": {
         "LowerTorso": "0,0,0,-2,1,3", "Waist": "0,0,0,3,2,-1", "UpperTorso": "0,0,0,3,1,2",
@@ -41,8 +48,10 @@ POSER = "%Collar %Shldr %ForeArm %Hand %Thigh %Shin %Foot"
 BIPED = "%_Clavicle %_UpperArm %_Forearm %_Hand %_Thigh %_Calf %_Foot"
 KINECT = "- Shoulder% Elbow% Wrist% Hip% Knee% Ankle%"
 
+HUMAN_IK_POSES = {1: 2, 2: 3, 3: 3, 4: 3}  # how many of them, by the number of spine joints
+
 SPINE = ["Spine"] + [f"Spine{i}" for i in range(1, 10)]
-CHEST = ["Chest"] + [f"Chest{i}" for i in range(2, 8)]
+CHEST = ["Chest"] + [f"Chest{i}" for i in range(2, 5)]
 
 PLAIN, BOTH, WITH = (False,), (False, True), (True,)  # without fingers, either way, with them
 
@@ -50,7 +59,8 @@ PLAIN, BOTH, WITH = (False,), (False, True), (True,)  # without fingers, either 
 # animator reads; {n} is the number of the spine's joints.
 CONVENTIONS = [
     *[(f"HumanIK{n:02}", "MotionBuilder / HumanIK ({n})", "", "Hips", SPINE[:n], "Neck", "Head", LEFT_RIGHT,
-       HUMAN_IK, ("straight", "curved") if n <= 4 else ("straight",), BOTH) for n in range(1, 11)],
+       HUMAN_IK, ("straight", "curved", "leaning")[:HUMAN_IK_POSES.get(n, 1)], BOTH if n <= 6 else PLAIN)
+      for n in range(1, 11)],
     *[(f"HumanIK{n:02}NoNeck", "MotionBuilder / HumanIK without neck ({n})", "", "Hips", SPINE[:n], "-", "Head",
        LEFT_RIGHT, HUMAN_IK, ("straight",), PLAIN) for n in (1, 2)],
     ("HumanIK02Neck1", "MotionBuilder / HumanIK, 21 joints ({n})", "", "Hips", SPINE[:2], "Neck1", "Head",
@@ -62,23 +72,23 @@ CONVENTIONS = [
      "%Shoulder %Arm %ForeArm %Hand %Thigh %Shin %Foot", ("straight",), WITH),
     ("Mixamo", "Mixamo ({n})", "mixamorig:", "Hips", SPINE[:3], "Neck", "Head", LEFT_RIGHT, HUMAN_IK, ("curved",),
      BOTH),
-    ("MixamoNoColon", "Mixamo without colon ({n})", "mixamorig", "Hips", SPINE[:3], "Neck", "Head", LEFT_RIGHT,
-     HUMAN_IK, ("curved",), WITH),
     ("CMUOriginal", "CMU, original names ({n})", "", "root", ["lowerback", "upperback", "thorax"], "lowerneck",
      "head", l_r, "%clavicle %humerus %radius %wrist %femur %tibia %foot", ("straight",), WITH),
     ("CMUMax", "CMU, 3ds Max names ({n})", "", "Hips", ["lowerback", "Chest", "Chest2"], "lowerneck", "Head",
      LEFT_RIGHT, BIOVISION, ("straight",), WITH),
-    *[(f"MaxLong{n}", "3ds Max / Biovision / Xsens ({n})", "", "Hips", CHEST[:n], "Neck", "Head", LEFT_RIGHT,
-       BIOVISION, ("straight",), PLAIN) for n in (2, 4)],
+    ("MaxLong2", "3ds Max / Biovision ({n})", "", "Hips", CHEST[:2], "Neck", "Head", LEFT_RIGHT, BIOVISION,
+     ("curved",), PLAIN),
+    ("Xsens", "Xsens MVN / 100STYLE ({n})", "", "Hips", CHEST[:4], "Neck", "Head", LEFT_RIGHT, BIOVISION,
+     ("bowed head",), PLAIN),
     ("MaxUpLeg", "3ds Max, second names ({n})", "", "Hips", CHEST[:1], "Neck", "Head", LEFT_RIGHT,
      "%Collar %UpArm %LowArm %Hand %UpLeg %LowLeg %Foot", ("straight",), PLAIN),
     ("PoserLong", "Poser / DAZ figures ({n})", "", "hip", ["abdomen", "chest"], "neck", "head", l_r, POSER,
-     ("straight",), BOTH),
+     ("straight",), WITH),
     ("DazGenesis2", "DAZ Genesis 1 and 2 ({n})", "", "hip", ["abdomen", "abdomen2", "chest"], "neck", "head", l_r,
      POSER, ("curved",), WITH),
     ("DazGenesis8", "DAZ Genesis 3 and 8 ({n})", "", "hip",
      ["abdomenLower", "abdomenUpper", "chestLower", "chestUpper"], "neckLower", "head", l_r,
-     "%Collar %ShldrBend %ForearmBend %Hand %ThighBend %Shin %Foot", ("curved",), WITH),
+     "%Collar %ShldrBend %ForearmBend %Hand %ThighBend %Shin %Foot", ("curved, heels",), WITH),
     ("DazGenesis9", "DAZ Genesis 9 ({n})", "", "hip", ["spine1", "spine2", "spine3", "spine4"], "neck1", "head",
      l_r, "%_shoulder %_upperarm %_forearm %_hand %_thigh %_shin %_foot", ("curved",), WITH),
     *[(f"Biped{n}", "3ds Max Biped ({n})", "Bip01_", "Pelvis", SPINE[:n], "Neck", "Head", L_R, BIPED, ("curved",),
@@ -153,10 +163,11 @@ def main():
         rows = mappings(prefix, hip, spine, neck, head, sides, limbs)
         for pose in poses:
             for with_fingers in fingers:
+                # What only some profiles of the convention have is told of them.
+                words = [pose] * (pose != poses[0]) + ["fingers"] * with_fingers
                 joints = f"{len(spine)} spine joint{'s' if len(spine) > 1 else ''}"
-                words = [joints] + ["curved"] * (len(poses) > 1 and pose == "curved") + ["fingers"] * with_fingers
-                suffix = ("Curved" if len(words) > 1 and "curved" in words else "") + ("Fingers" if with_fingers else "")
-                write(file + suffix, name.format(n=", ".join(words)), rows,
+                write(file + "".join(word.capitalize() for word in words),
+                      name.format(n=", ".join([joints] + words)), rows,
                       POSES[pose] | (FINGERS if with_fingers else {}))
 
 

@@ -20,7 +20,7 @@ const CKeyframeControl* TrackOf(const CNode& node)
 {
     for (const CControl* control = node.GetControl(); control; control = control->GetNext())
     {
-        if (const auto* track = RecordCast<const CKeyframeControl>(control))
+        if (const auto* track = dynamic_cast<const CKeyframeControl*>(control))
             return track;
     }
     return nullptr;

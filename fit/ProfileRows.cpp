@@ -5,7 +5,10 @@
 #include "FindBone.h"
 #include "HostBones.h"
 #include "ProfileFile.h"
+#include "SharedPrefix.h"
 #include "Text.h"
+
+#include <vector>
 
 namespace gw {
 
@@ -49,6 +52,30 @@ std::string TextOf(const ProfileRows& profile)
     return ProfileText(profile.name, profile.frameRate, profile.position, profile.rows);
 }
 
+std::string SourcePrefix(const CMapRowTable& rows)
+{
+    std::vector<std::string_view> names;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        if (!rows.IsFixed(row))
+            names.push_back(rows.Text(row, kSourceColumn));
+    }
+    return names.size() > 1 ? CommonStart(names) : std::string();
+}
+
+CMapRowTable WithPrefix(const CMapRowTable& rows, std::string_view oldPrefix, std::string_view newPrefix)
+{
+    CMapRowTable changed;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        std::string source = rows.Text(row, kSourceColumn);
+        if (!rows.IsFixed(row))
+            source.replace(0, oldPrefix.size(), newPrefix);
+        changed.AddRow(source, rows.Text(row, kTargetColumn), rows.Numbers(row), ERowColumns::All);
+    }
+    return changed;
+}
+
 RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
                    CRetargeter& table)
 {
@@ -58,6 +85,7 @@ RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CB
         const ERowFit fit = ApplyRow(rows, row, sources, targets, &table);
         ++match.rowCount;
         match.foundCount += fit == ERowFit::Missing ? 0 : 1;
+        match.mappedCount += fit == ERowFit::Mapped ? 1 : 0;
         if (EqualNoCase(rows.Text(row, kTargetColumn), kRootBone))
             match.drivesRoot = fit == ERowFit::Mapped;
     }

@@ -4,6 +4,7 @@
 #include "Vec3.h"
 
 #include <string>
+#include <string_view>
 
 namespace gw {
 
@@ -24,11 +25,17 @@ bool ReadProfileRows(const std::string& path, ProfileRows& profile);
 /// The bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 
+/// The start that the source names of all rows share; empty where they share none or there is no row.
+std::string SourcePrefix(const CMapRowTable& rows);
+/// The rows with another start in place of that one before every source name.
+CMapRowTable WithPrefix(const CMapRowTable& rows, std::string_view oldPrefix, std::string_view newPrefix);
+
 /// How many rows there are, fixed ones included, and how many find their bones.
 struct RowMatch
 {
     int rowCount = 0;
     int foundCount = 0;
+    int mappedCount = 0;     ///< those of them that have a source
     bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
 
     /// Whether a conversion accepts the rows.

@@ -5,13 +5,13 @@
 #include "CShellWindow.h"
 #include "Commands.h"
 #include "Paths.h"
-#include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "ReportJson.h"
 #include "Text.h"
 #include "Words.h"
 
 #include <cstdio>
+#include <optional>
 
 namespace gw {
 
@@ -29,11 +29,8 @@ bool SelectProfile(const COptions& options, CShellWindow& window, CShellContent&
     window.SetPaths(first, {});
     if (content.OpenSource() == 0 || window.HasFailed())
         return false;
-    CProfileFit best;
-    const bool selected = content.SelectFittingProfile(best);
-    if (!selected)
-        window.Report(NoneFitsReport(first, best));
-    return selected;
+    std::optional<CProfileFit> nearest;
+    return content.SelectFittingProfile(first, nearest);
 }
 
 void WriteJson(const COptions& options, const CShellWindow& window, size_t finished)

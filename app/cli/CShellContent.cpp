@@ -3,6 +3,7 @@
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CReport.h"
+#include "DoubtWords.h"
 #include "Paths.h"
 #include "ProfileChoice.h"
 #include "ProfileFile.h"
@@ -11,12 +12,14 @@
 #include "Words.h"
 
 #include <algorithm>
+#include <unordered_set>
 
 namespace gw {
 
 namespace {
 
-constexpr int kStock = 1; // user data of a list entry
+// The stock profiles of old, the one that is asked first.
+constexpr const char* kLongKnown[] = {"PoserBVH.prf", "MaxBVH.prf"};
 
 std::vector<std::string> NamesOf(const std::vector<CInstalledProfile>& profiles)
 {
@@ -51,16 +54,20 @@ std::string CShellContent::FindProfilePath(const std::string& name)
     return CGaitConvertContent::FindProfilePath(name);
 }
 
+// Reads each folder once: asking for the path of every name would read all files for each.
 std::vector<CInstalledProfile> CShellContent::InstalledProfiles()
 {
     std::vector<CInstalledProfile> profiles;
-    const CCntComboExControl& list = m_kWindow.ProfileCombo();
-    for (int index = 0; const std::string* name = list.GetItemText(index); ++index)
+    std::unordered_set<std::string> names;
+    for (const bool stock : {true, false})
     {
-        const auto isNamed = [&](const CInstalledProfile& other) { return EqualNoCase(other.name, *name); };
-        const std::string path = FindProfilePath(*name);
-        if (!path.empty() && std::ranges::none_of(profiles, isNamed))
-            profiles.push_back({*name, path, list.GetItemUserData(index) == kStock});
+        const std::string folder = stock ? ExeFile({}) : ProfileFile({});
+        for (const std::string& file : FilesInFolder(folder, ".prf"))
+        {
+            std::string name = ReadProfileName(folder + file);
+            if (names.insert(LowerCase(name)).second)
+                profiles.push_back({std::move(name), folder + file, stock});
+        }
     }
     return profiles;
 }
@@ -96,21 +103,78 @@ bool CShellContent::SelectProfile(const std::string& nameOrFile)
     return true;
 }
 
-bool CShellContent::SelectFittingProfile(CProfileFit& best)
+std::vector<ProfileChoice> CShellContent::HoldAgainstSource(std::span<const std::string> paths) const
+{
+    CNode* const source = SourceRoot();
+    CNode* const target = ResultMotion().motionRoot.Get();
+    return source && target ? gw::ChooseProfile(paths, *source, *target) : std::vector<ProfileChoice>();
+}
+
+std::vector<ProfileChoice> CShellContent::Choices()
+{
+    std::vector<std::string> paths;
+    for (const CInstalledProfile& profile : InstalledProfiles())
+        paths.push_back(profile.path);
+    // Where nothing fits at all, what is told of is a profile that animators know.
+    std::ranges::stable_sort(paths, {}, [&](const std::string& path) {
+        return std::ranges::find_if(kLongKnown, [&](const char* file) { return path == ExeFile(file); });
+    });
+    std::vector<ProfileChoice> choices = HoldAgainstSource(paths);
+    const auto pick = std::ranges::find(choices, ProfilePath(), &ProfileChoice::path);
+    if (pick != choices.end())
+        std::rotate(choices.begin(), pick, pick + 1);
+    return choices;
+}
+
+bool CShellContent::SelectFittingProfile(const std::string& source, std::optional<CProfileFit>& nearest)
 {
     if (!ProfilePath().empty())
-        return true; // a stock profile, chosen when the source was opened
-    best = {};
-    for (const CInstalledProfile& profile : InstalledProfiles())
+        return KeepStockPick(source);
+    const std::vector<ProfileChoice> choices = Choices();
+    if (!choices.empty() && choices.front().match.IsWhole())
+        return Take(source, choices.front());
+    nearest.emplace();
+    if (!choices.empty())
+        Measure(choices.front().path, *nearest);
+    m_kWindow.Report(NoneFitsReport(source, *nearest));
+    return false;
+}
+
+// A stock profile has always been taken where its rows fit: what speaks against it is a warning.
+bool CShellContent::KeepStockPick(const std::string& source)
+{
+    const std::string path[] = {ProfilePath()};
+    for (ProfileChoice& choice : HoldAgainstSource(path))
     {
-        CProfileFit fit;
-        if (Measure(profile.path, fit) && IsBetterFit(fit, best))
-            best = fit;
+        std::erase_if(choice.verdict.doubts, [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
+        for (const CReport& warning : DoubtWarnings(source, choice))
+            m_kWindow.Report(warning);
     }
-    if (!best.IsWhole() || best.rowCount == 0)
-        return false;
-    SelectProfileByName(best.name);
     return true;
+}
+
+bool CShellContent::Take(const std::string& source, const ProfileChoice& choice)
+{
+    if (choice.verdict.sureness == ESureness::Doubtful)
+    {
+        m_kWindow.Report(DoubtfulReport(source, choice));
+        return false;
+    }
+    for (const CReport& warning : DoubtWarnings(source, choice))
+        m_kWindow.Report(warning);
+    m_kChosen = choice;
+    if (!choice.text.empty())
+        return SelectAdapted(choice);
+    SelectProfileByName(choice.name);
+    return true;
+}
+
+bool CShellContent::SelectAdapted(const ProfileChoice& choice)
+{
+    if (m_kAdapted.Write(choice.text))
+        return SelectProfile(m_kAdapted.Path());
+    m_kWindow.Report(ShellFailure(choice.path, "adapted", "the profile cannot be kept in a temporary file"));
+    return false;
 }
 
 bool CShellContent::Measure(const std::string& profilePath, CProfileFit& fit) const

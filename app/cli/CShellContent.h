@@ -1,7 +1,11 @@
 #pragma once
 
 #include "CGaitConvertContent.h"
+#include "CPrivateProfile.h"
+#include "ChooseProfile.h"
 
+#include <optional>
+#include <span>
 #include <string>
 #include <vector>
 
@@ -31,10 +35,14 @@ public:
     std::string ResolveProfile(const std::string& nameOrFile);
     /// Selects such a profile. Says why it cannot.
     bool SelectProfile(const std::string& nameOrFile);
-    /// Sees to it that a profile is selected: the stock profile that fits the open source, else the installed
-    /// one of which all rows fit, with the most rows. False where none does; `best` is the nearest then,
-    /// without rows where none is installed.
-    bool SelectFittingProfile(CProfileFit& best);
+    /// The installed profiles, the best one for the open source first: the stock profile that was chosen when
+    /// it was opened, then by ChooseProfile.
+    std::vector<ProfileChoice> Choices();
+    /// Sees to it that a profile is selected: the first of the choices. False, with the reason said, where no
+    /// profile fits, when `nearest` tells how far the nearest one does, and where the first one is doubtful.
+    bool SelectFittingProfile(const std::string& source, std::optional<CProfileFit>& nearest);
+    /// What was selected so; nothing for a profile that was named.
+    const std::optional<ProfileChoice>& Chosen() const { return m_kChosen; }
     /// How a profile fits the open source. False when its file cannot be read.
     bool Measure(const std::string& profilePath, CProfileFit& fit) const;
 
@@ -42,9 +50,16 @@ public:
     std::string FindProfilePath(const std::string& name) override;
 
 private:
+    std::vector<ProfileChoice> HoldAgainstSource(std::span<const std::string> paths) const;
+    bool KeepStockPick(const std::string& source);
+    bool Take(const std::string& source, const ProfileChoice& choice);
+    bool SelectAdapted(const ProfileChoice& choice);
+
     CContentWindow& m_kWindow;
     std::string m_kFileName; ///< display name of the profile in m_kFilePath
     std::string m_kFilePath; ///< of the profile that was named by its file, or empty
+    CPrivateProfile m_kAdapted;
+    std::optional<ProfileChoice> m_kChosen;
 };
 
 } // namespace gw

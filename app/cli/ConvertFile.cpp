@@ -5,6 +5,7 @@
 #include "CJsonWriter.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
+#include "DoubtWords.h"
 #include "Output.h"
 #include "ProfileChoice.h"
 #include "ProfileFit.h"
@@ -29,6 +30,7 @@ struct Account
     std::string profilePath;
     int frames = 0;
     std::optional<CProfileFit> misfit;
+    std::optional<ProfileChoice> chosen; ///< a profile that was neither named nor the stock one of old
 };
 
 // One run of the state machine, step by step. Each step answers whether the next may follow.
@@ -70,20 +72,15 @@ private:
 
 bool CConversion::SelectProfile()
 {
-    CProfileFit best;
-    if (!m_kOptions.profile.empty())
-    {
-        if (!m_kContent.SelectProfile(m_kOptions.profile))
-            return false;
-    }
-    else if (!m_kContent.SelectFittingProfile(best))
-    {
-        m_kWindow.Report(NoneFitsReport(m_kJob.source, best));
-        m_kAccount.misfit = best;
+    const bool selected = m_kOptions.profile.empty()
+                              ? m_kContent.SelectFittingProfile(m_kJob.source, m_kAccount.misfit)
+                              : m_kContent.SelectProfile(m_kOptions.profile);
+    if (!selected)
         return false;
-    }
     m_kContent.Profile()->GetProfileName(m_kAccount.profile);
-    m_kAccount.profilePath = m_kContent.ProfilePath();
+    m_kAccount.chosen = m_kContent.Chosen();
+    // An adapted profile lies in a file that is gone when this is read.
+    m_kAccount.profilePath = m_kAccount.chosen ? m_kAccount.chosen->path : m_kContent.ProfilePath();
     return true;
 }
 
@@ -132,16 +129,23 @@ EConversion Decide(const COptions& options, const CConversionJob& job, CShellWin
     return EConversion::Failed;
 }
 
+// How sure the choice is stands behind a profile that was chosen.
+std::string ProfileWords(const Account& account)
+{
+    const std::string name = Quoted(account.profile);
+    return account.chosen ? name + ", " + SurenessName(account.chosen->verdict.sureness) : name;
+}
+
 void Print(const CConversionJob& job, const Account& account)
 {
     const std::string paths = Printable(job.source) + " -> " + Printable(job.output);
     if (account.outcome == EConversion::Skipped)
         std::printf("%s: skipped, the output exists\n", paths.c_str());
     else if (account.outcome == EConversion::Planned)
-        std::printf("%s: would be converted by profile %s\n", paths.c_str(), Quoted(account.profile).c_str());
+        std::printf("%s: would be converted by profile %s\n", paths.c_str(), ProfileWords(account).c_str());
     else if (account.outcome == EConversion::Converted)
         std::printf("%s: %d frames by profile %s\n", paths.c_str(), account.frames,
-                    Quoted(account.profile).c_str());
+                    ProfileWords(account).c_str());
 }
 
 void WriteJson(const CConversionJob& job, const Account& account, const CShellWindow& window)
@@ -154,6 +158,8 @@ void WriteJson(const CConversionJob& job, const Account& account, const CShellWi
     json.Key("profile").Text(account.profile);
     json.Key("profilePath").Text(account.profilePath);
     json.Key("frames").Integer(account.frames);
+    if (account.chosen)
+        WriteVerdict(json, account.chosen->verdict);
     WriteReports(json, window.Reports());
     if (account.misfit)
     {

@@ -6,25 +6,7 @@
 #include "ProfileFit.h"
 #include "Words.h"
 
-#include <tuple>
-
 namespace gw {
-
-namespace {
-
-// Larger is better.
-auto Rank(const CProfileFit& fit)
-{
-    const bool whole = fit.IsWhole();
-    return std::tuple(whole, whole ? 0 : fit.foundCount - fit.rowCount, fit.rowCount);
-}
-
-} // namespace
-
-bool IsBetterFit(const CProfileFit& fit, const CProfileFit& other)
-{
-    return other.rowCount == 0 || Rank(fit) > Rank(other);
-}
 
 CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest)
 {

@@ -3,12 +3,14 @@
 #include "CShellContent.h"
 #include "CShellWindow.h"
 #include "Commands.h"
+#include "DoubtWords.h"
 #include "FitWords.h"
 #include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "Text.h"
 #include "Words.h"
 
+#include <algorithm>
 #include <cstdio>
 #include <optional>
 
@@ -18,30 +20,64 @@ namespace {
 
 struct Entry
 {
-    CInstalledProfile profile;
-    std::optional<CProfileFit> fit; // with a source
+    std::string name;
+    std::string path;
+    bool stock = false;
+    std::optional<CProfileFit> fit;        // with a source
+    std::optional<ProfileVerdict> verdict; // of one that fits
 };
 
-std::vector<Entry> Entries(CShellContent& content, bool withFit)
+std::vector<Entry> Installed(CShellContent& content)
 {
     std::vector<Entry> entries;
     for (const CInstalledProfile& profile : content.InstalledProfiles())
+        entries.push_back({profile.name, profile.path, profile.stock, {}, {}});
+    return entries;
+}
+
+CProfileFit FitOf(const CShellContent& content, const ProfileChoice& choice)
+{
+    CProfileFit fit{choice.name, choice.match.rowCount, choice.match.foundCount, choice.match.drivesRoot, {}};
+    if (!choice.match.IsWhole())
+        content.Measure(choice.path, fit);
+    return fit;
+}
+
+// The one that a conversion takes first.
+std::vector<Entry> ByFit(CShellContent& content)
+{
+    const std::vector<CInstalledProfile> installed = content.InstalledProfiles();
+    std::vector<Entry> entries;
+    for (const ProfileChoice& choice : content.Choices())
     {
-        CProfileFit fit;
-        const bool measured = withFit && content.Measure(profile.path, fit);
-        entries.push_back({profile, measured ? std::optional(fit) : std::nullopt});
+        const auto profile = std::ranges::find(installed, choice.path, &CInstalledProfile::path);
+        const bool stock = profile != installed.end() && profile->stock;
+        entries.push_back({choice.name, choice.path, stock, FitOf(content, choice), {}});
+        if (choice.match.IsWhole())
+            entries.back().verdict = choice.verdict;
     }
     return entries;
 }
 
+// What a profile for another skeleton misses is nothing to read.
+std::string Missing(const CProfileFit& fit)
+{
+    return 2 * fit.foundCount < fit.rowCount ? "" : MissingLines(fit);
+}
+
 void Print(const Entry& entry)
 {
-    std::printf("%s (%s, %s)%s%s\n", Printable(entry.profile.name).c_str(),
-                entry.profile.stock ? "stock" : "own", Printable(entry.profile.path).c_str(),
-                entry.fit ? ": " : "", entry.fit ? FitSummary(*entry.fit).c_str() : "");
-    const std::string missing = entry.fit ? MissingLines(*entry.fit) : "";
-    if (!missing.empty())
+    std::string line = Printable(entry.name) + " (" + (entry.stock ? "stock" : "own") + ", " +
+                       Printable(entry.path) + ')';
+    if (entry.fit)
+        line += ": " + FitSummary(*entry.fit);
+    if (entry.verdict)
+        line += std::string(", ") + SurenessName(entry.verdict->sureness);
+    std::puts(line.c_str());
+    if (const std::string missing = entry.fit ? Missing(*entry.fit) : ""; !missing.empty())
         std::puts(missing.c_str());
+    for (const std::string& words : entry.verdict ? DoubtWords(*entry.verdict) : std::vector<std::string>())
+        std::printf("  %s\n", words.c_str());
 }
 
 void WriteJson(const std::vector<Entry>& entries)
@@ -53,11 +89,13 @@ void WriteJson(const std::vector<Entry>& entries)
     {
         json.BreakLine();
         json.BeginObject();
-        json.Key("name").Text(entry.profile.name);
-        json.Key("path").Text(entry.profile.path);
-        json.Key("stock").Bool(entry.profile.stock);
+        json.Key("name").Text(entry.name);
+        json.Key("path").Text(entry.path);
+        json.Key("stock").Bool(entry.stock);
         if (entry.fit)
             WriteFit(json, *entry.fit);
+        if (entry.verdict)
+            WriteVerdict(json, *entry.verdict);
         json.EndObject();
     }
     json.EndArray();
@@ -79,7 +117,7 @@ EExit RunProfiles(const COptions& options)
         if (content.OpenSource() == 0 || window.HasFailed())
             return EExit::Failed;
     }
-    const std::vector<Entry> entries = Entries(content, hasSource);
+    const std::vector<Entry> entries = hasSource ? ByFit(content) : Installed(content);
     if (options.json)
         WriteJson(entries);
     for (const Entry& entry : options.json ? std::vector<Entry>() : entries)

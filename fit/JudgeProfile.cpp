@@ -1,0 +1,86 @@
+#include "JudgeProfile.h"
+
+#include "BodyJoints.h"
+#include "CRetargeter.h"
+#include "RowTurns.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+// Half way from a frame that stands right to one that stands across, with room for a limb that is bent.
+constexpr double kAcross = 60.0;
+
+bool IsOneOf(const std::vector<CNode*>& joints, const CNode* joint)
+{
+    return std::ranges::find(joints, joint) != joints.end();
+}
+
+// The same place for a profile: of several necks any will do, and of a spine the rows tell none.
+bool IsSamePlace(const BodyPlace& place, const CBodyMap& byNames, const CNode* joint)
+{
+    if (place.joint == EBodyJoint::Neck)
+        return IsOneOf(byNames.neck, joint);
+    return place.joint == EBodyJoint::Spine || JointAt(byNames, place) == joint;
+}
+
+void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict& verdict)
+{
+    for (const BodyPlace& place : BodyPlaces())
+    {
+        CNode* const joint = JointAt(body, place);
+        CNode* const named = JointAt(byNames, place);
+        if (joint && named && !IsSamePlace(place, byNames, joint))
+            verdict.doubts.push_back({EProfileDoubt::OtherName, {}, joint, named});
+    }
+}
+
+// A torso that a collar drives has no place in the spine.
+void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdict)
+{
+    const auto place = std::ranges::find(body.spine, chest);
+    if (place == body.spine.end())
+        return;
+    verdict.leftOut = static_cast<size_t>(body.spine.end() - place - 1);
+    if (verdict.leftOut > 0)
+        verdict.doubts.push_back({EProfileDoubt::SpineCut, {}, chest, body.spine.back()});
+}
+
+void CheckTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body, ProfileVerdict& verdict)
+{
+    const std::vector<RowTurn> turns = MeasureTurns(table, targetRoot, body);
+    for (const RowTurn& turn : turns)
+    {
+        verdict.turn += turn.degrees / static_cast<double>(turns.size());
+        if (turn.degrees > kAcross)
+            verdict.doubts.push_back({EProfileDoubt::Turned, {}, table.SourceOf(turn.target), nullptr});
+    }
+}
+
+ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
+{
+    const auto isOfPlaces = [](const ProfileDoubt& doubt) { return doubt.kind == EProfileDoubt::Places; };
+    if (std::ranges::any_of(doubts, isOfPlaces))
+        return ESureness::Doubtful;
+    return doubts.empty() ? ESureness::Sure : ESureness::Likely;
+}
+
+} // namespace
+
+ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const CBodyMap& byNames)
+{
+    const CBodyMap body = BodyOfTable(table, targetRoot);
+    ProfileVerdict verdict;
+    for (const BodyDoubt& doubt : CheckBody(body))
+        verdict.doubts.push_back({EProfileDoubt::Places, doubt, doubt.joint, nullptr});
+    CompareNames(body, byNames, verdict);
+    CheckSpine(body, table.SourceOf(FindNode(&targetRoot, "UpperTorso")), verdict);
+    CheckTurns(table, targetRoot, body, verdict);
+    verdict.sureness = SurenessOf(verdict.doubts);
+    return verdict;
+}
+
+} // namespace gw

@@ -1,0 +1,58 @@
+#pragma once
+
+#include "CBodyMap.h"
+#include "CheckBody.h"
+
+#include <cstddef>
+#include <cstdint>
+#include <vector>
+
+namespace gw {
+
+class CNode;
+class CRetargeter;
+
+/// How sure it is that a profile's rows name the joints that they should.
+enum class ESureness : uint8_t
+{
+    Sure,     ///< nothing speaks against it
+    Likely,   ///< it serves, with the flaws that its doubts tell
+    Doubtful, ///< the body's places speak against it
+};
+
+/// What speaks against a profile.
+enum class EProfileDoubt : uint8_t
+{
+    Places,    ///< a body of these joints cannot be; see `body`
+    OtherName, ///< by its name the joint has another part in the body, which `other` has here
+    SpineCut,  ///< spine joints above the one that drives the upper torso are left out
+    Turned,    ///< the bone comes out turned across, about a quarter turn or more
+};
+
+/// Whether a doubt is about which joint is which, and not about how well the bones come out.
+constexpr bool IsOfRoles(EProfileDoubt kind)
+{
+    return kind == EProfileDoubt::Places || kind == EProfileDoubt::OtherName;
+}
+
+struct ProfileDoubt
+{
+    EProfileDoubt kind = EProfileDoubt::Places;
+    BodyDoubt body;               ///< of Places
+    const CNode* joint = nullptr; ///< of the source
+    const CNode* other = nullptr; ///< of the source, or null
+};
+
+/// What is told of a profile whose rows all fit.
+struct ProfileVerdict
+{
+    ESureness sureness = ESureness::Sure;
+    std::vector<ProfileDoubt> doubts;
+    size_t leftOut = 0; ///< spine joints above the one that drives the upper torso
+    double turn = 0.0;  ///< mean angle in degrees that the bones come out turned across
+};
+
+/// Judges the rows that a retargeter was told. `byNames` is the source's body as FindBodyByNames reads it.
+ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const CBodyMap& byNames);
+
+} // namespace gw
