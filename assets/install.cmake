@@ -1,7 +1,8 @@
 # Copies the data files beside the executables. Stock profiles are told from a user's own by being read-only.
 file(GLOB data ${FROM}/*.htr ${FROM}/*.bsm)
 file(GLOB profiles ${FROM}/*.prf)
-foreach(source IN LISTS data profiles)
+file(GLOB installed ${TO}/*.prf) # a profile that is stock no more goes, too
+foreach(source IN LISTS data installed)
   get_filename_component(name ${source} NAME)
   file(REMOVE ${TO}/${name})
 endforeach()

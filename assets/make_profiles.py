@@ -13,8 +13,11 @@ POSES = {
     "straight": FEET,
     # A spine that leans back and a neck that leans forward turn their frames by a quarter, whatever the angle.
     "curved": FEET | {"Waist": "0,0,0,3,2,-1", "Neck": "0,0,0,-3,2,1"},
+    # So does a head whose end leans back over it.
+    "curved, head back": FEET | {"Waist": "0,0,0,3,2,-1", "Neck": "0,0,0,-3,2,1", "Head": "0,0,0,3,2,-1"},
     # A spine that leans forward turns the other way.
     "leaning": FEET | {"Waist": "0,0,0,-3,2,1", "Neck": "0,0,0,-3,2,1"},
+    "leaning, head back": FEET | {"Waist": "0,0,0,-3,2,1", "Neck": "0,0,0,-3,2,1", "Head": "0,0,0,3,2,-1"},
     # A middle foot behind the ankle.
     "curved, heels": {"Waist": "0,0,0,3,2,-1", "Neck": "0,0,0,-3,2,1", "LFoot": "0,0,0,-3,2,1",
                       "RFoot": "0,0,0,-3,2,1"},
@@ -61,6 +64,8 @@ CONVENTIONS = [
     *[(f"HumanIK{n:02}", "MotionBuilder / HumanIK ({n})", "", "Hips", SPINE[:n], "Neck", "Head", LEFT_RIGHT,
        HUMAN_IK, ("straight", "curved", "leaning")[:HUMAN_IK_POSES.get(n, 1)], BOTH if n <= 6 else PLAIN)
       for n in range(1, 11)],
+    *[(f"HumanIK{n:02}HeadBack", "MotionBuilder / HumanIK ({n}, curved, head back)", "", "Hips", SPINE[:n], "Neck",
+       "Head", LEFT_RIGHT, HUMAN_IK, ("curved, head back",), WITH) for n in (3, 4)],
     *[(f"HumanIK{n:02}NoNeck", "MotionBuilder / HumanIK without neck ({n})", "", "Hips", SPINE[:n], "-", "Head",
        LEFT_RIGHT, HUMAN_IK, ("straight",), PLAIN) for n in (1, 2)],
     ("HumanIK02Neck1", "MotionBuilder / HumanIK, 21 joints ({n})", "", "Hips", SPINE[:2], "Neck1", "Head",
@@ -74,6 +79,8 @@ CONVENTIONS = [
      BOTH),
     ("CMUOriginal", "CMU, original names ({n})", "", "root", ["lowerback", "upperback", "thorax"], "lowerneck",
      "head", l_r, "%clavicle %humerus %radius %wrist %femur %tibia %foot", ("straight",), WITH),
+    ("CMU", "CMU, MotionBuilder names ({n})", "", "Hips", ["LowerBack", "Spine", "Spine1"], "Neck", "Head",
+     LEFT_RIGHT, HUMAN_IK, ("leaning, head back",), WITH),
     ("CMUMax", "CMU, 3ds Max names ({n})", "", "Hips", ["lowerback", "Chest", "Chest2"], "lowerneck", "Head",
      LEFT_RIGHT, BIOVISION, ("straight",), WITH),
     ("MaxLong2", "3ds Max / Biovision ({n})", "", "Hips", CHEST[:2], "Neck", "Head", LEFT_RIGHT, BIOVISION,
@@ -92,9 +99,9 @@ CONVENTIONS = [
     ("DazGenesis9", "DAZ Genesis 9 ({n})", "", "hip", ["spine1", "spine2", "spine3", "spine4"], "neck1", "head",
      l_r, "%_shoulder %_upperarm %_forearm %_hand %_thigh %_shin %_foot", ("curved",), WITH),
     *[(f"Biped{n}", "3ds Max Biped ({n})", "Bip01_", "Pelvis", SPINE[:n], "Neck", "Head", L_R, BIPED, ("curved",),
-       WITH) for n in (2, 3, 4)],
+       WITH) for n in (3, 4)],
     *[(f"Biped{n}NoBlanks", "3ds Max Biped without blanks ({n})", "Bip01", "Pelvis", SPINE[:n], "Neck", "Head",
-       L_R, BIPED.replace("_", ""), ("curved",), WITH) for n in (2, 3, 4)],
+       L_R, BIPED.replace("_", ""), ("curved",), WITH) for n in (3, 4)],
     ("XsensMVN", "Xsens MVN segments ({n})", "", "Pelvis", ["L5", "L3", "T12", "T8"], "Neck", "Head", LEFT_RIGHT,
      "%Shoulder %UpperArm %ForeArm %Hand %UpperLeg %LowerLeg %Foot", ("straight",), PLAIN),
     ("IPi", "iPi Mocap Studio ({n})", "", "Hip", ["LowerSpine", "MiddleSpine", "Chest"], "Neck", "Head", L_R,

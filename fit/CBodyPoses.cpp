@@ -97,8 +97,8 @@ Mat3 CBodyPoses::Axes() const
 {
     const Vec3 left = Place(*m_kBody.Leg(EBodySide::Left).thigh);
     const Vec3 right = Place(*m_kBody.Leg(EBodySide::Right).thigh);
-    const Vec3 arms = Middle(Place(*m_kBody.Arm(EBodySide::Left).upperArm),
-                             Place(*m_kBody.Arm(EBodySide::Right).upperArm));
+    const Vec3 arms =
+        Middle(Place(*m_kBody.Arm(EBodySide::Left).upperArm), Place(*m_kBody.Arm(EBodySide::Right).upperArm));
     const Vec3 up = Vec3Normalized(arms - Middle(left, right));
     const Vec3 forward = Vec3Normalized(Vec3Cross(left - right, up));
     Mat3 axes;

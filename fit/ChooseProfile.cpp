@@ -1,103 +1,100 @@
 #include "ChooseProfile.h"
 
 #include "CRetargeter.h"
-#include "FindBodyByNames.h"
 #include "FindBone.h"
 #include "SharedPrefix.h"
+#include "Text.h"
 
 #include <algorithm>
+#include <array>
+#include <functional>
+#include <map>
+#include <optional>
 #include <tuple>
 
 namespace gw {
 
 namespace {
 
-// Both skeletons with their names, for all profiles.
-struct Skeletons
+// Both skeletons, looked at once for all profiles.
+class CSkeletons
 {
-    Skeletons(CNode& source, CNode& targetRoot)
-        : target(targetRoot), sourceNames(&source), targetNames(&targetRoot), byNames(FindBodyByNames(source))
+public:
+    CSkeletons(CNode& source, CNode& target)
+        : m_kSource(source), m_kTarget(target), m_kSourceNames(&source), m_kTargetNames(&target)
     {
     }
 
-    CNode& target;
-    CBoneNames sourceNames;
-    CBoneNames targetNames;
-    CBodyMap byNames;
+    void Hold(ProfileChoice& choice);
+    const std::vector<std::string>& SourceNames() const { return m_kSourceNames.Names(); }
+
+private:
+    // What takes a walk over poses waits for the first profile that fits.
+    const SourceBody& Body()
+    {
+        if (!m_kBody)
+            m_kBody.emplace(m_kSource);
+        return *m_kBody;
+    }
+
+    CNode& m_kSource;
+    CNode& m_kTarget;
+    CBoneNames m_kSourceNames;
+    CBoneNames m_kTargetNames;
+    std::optional<SourceBody> m_kBody;
 };
 
-struct Candidate
-{
-    ProfileRows rows;
-    ProfileChoice choice;
-    size_t kinship = 0; ///< how much of its own prefix stands in the source's
-};
-
-ProfileVerdict Judge(const ProfileRows& profile, const Skeletons& skeletons, RowMatch& match)
+void CSkeletons::Hold(ProfileChoice& choice)
 {
     CRetargeter table;
-    match = ApplyRows(profile.rows, skeletons.sourceNames, skeletons.targetNames, table);
-    return match.IsWhole() ? JudgeProfile(table, skeletons.target, skeletons.byNames) : ProfileVerdict();
+    choice.match = ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
+    if (choice.match.IsWhole())
+        choice.verdict = JudgeProfile(table, m_kTarget, Body());
 }
 
-std::vector<Candidate> ReadCandidates(std::span<const std::string> paths, const Skeletons& skeletons)
+// Larger is better. A profile of which rows do not fit is ranked by the share of those that do.
+auto Rank(const ProfileChoice& choice)
 {
-    std::vector<Candidate> candidates;
-    for (const std::string& path : paths)
-    {
-        Candidate candidate;
-        if (!ReadProfileRows(path, candidate.rows))
-            continue;
-        candidate.choice.path = path;
-        candidate.choice.name = candidate.rows.name;
-        candidate.choice.verdict = Judge(candidate.rows, skeletons, candidate.choice.match);
-        candidates.push_back(std::move(candidate));
-    }
-    return candidates;
-}
-
-// Larger is better. A profile whose rows do not all fit is judged by nothing else than their share.
-auto Rank(const Candidate& candidate)
-{
-    const RowMatch& match = candidate.choice.match;
-    const ProfileVerdict& verdict = candidate.choice.verdict;
+    const RowMatch& match = choice.match;
+    const ProfileVerdict& verdict = choice.verdict;
     const bool whole = match.IsWhole();
     const double share = whole ? 1.0 : static_cast<double>(match.mappedCount) / std::max(match.rowCount, 1);
     return std::tuple(whole, share, whole ? match.rowCount : 0, verdict.sureness != ESureness::Doubtful,
-                      -static_cast<double>(verdict.leftOut), -verdict.turn, candidate.kinship);
+                      -static_cast<double>(verdict.leftOut), -verdict.turn);
 }
 
-Candidate Adapted(const Candidate& candidate, const std::string& ownPrefix, const std::string& prefix,
-                  const Skeletons& skeletons)
+ProfileChoice Adapted(const ProfileChoice& choice, const std::string& ownPrefix, const std::string& prefix)
 {
-    Candidate adapted = candidate;
-    adapted.rows.rows = WithPrefix(candidate.rows.rows, ownPrefix, prefix);
-    adapted.rows.name += prefix.empty() ? ", no prefix" : ", prefix " + prefix;
-    adapted.kinship = CommonStart(std::array<std::string_view, 2>{ownPrefix, prefix}).size();
-    ProfileChoice& choice = adapted.choice;
-    choice.verdict = Judge(adapted.rows, skeletons, choice.match);
-    choice.name = adapted.rows.name;
-    choice.text = TextOf(adapted.rows);
+    ProfileChoice adapted = choice;
+    adapted.adapted = true;
+    adapted.profile.rows = WithPrefix(choice.profile.rows, ownPrefix, prefix);
+    adapted.profile.name += prefix.empty() ? ", no prefix" : ", prefix " + prefix;
     return adapted;
 }
 
-std::vector<Candidate> AdaptedOnes(const std::vector<Candidate>& candidates, const Skeletons& skeletons)
+// Those with much of the source's prefix as their own come first: their names say most about it.
+std::vector<ProfileChoice> AdaptedOnes(const std::vector<ProfileChoice>& choices, CSkeletons& skeletons)
 {
-    std::vector<std::string> prefixes = SharedPrefixes(skeletons.sourceNames.Names());
+    std::vector<std::string> prefixes = SharedPrefixes(skeletons.SourceNames());
     prefixes.emplace_back();
-    std::vector<Candidate> whole;
-    for (const Candidate& candidate : candidates)
+    std::multimap<size_t, ProfileChoice, std::greater<>> byKinship;
+    for (const ProfileChoice& choice : choices)
     {
-        const std::string ownPrefix = SourcePrefix(candidate.rows.rows);
+        const std::string ownPrefix = SourcePrefix(choice.profile.rows);
         for (const std::string& prefix : prefixes)
         {
-            if (prefix == ownPrefix)
+            if (EqualNoCase(prefix, ownPrefix))
                 continue;
-            Candidate adapted = Adapted(candidate, ownPrefix, prefix, skeletons);
-            if (adapted.choice.match.IsWhole())
-                whole.push_back(std::move(adapted));
+            ProfileChoice adapted = Adapted(choice, ownPrefix, prefix);
+            skeletons.Hold(adapted);
+            const std::array<std::string_view, 2> both{ownPrefix, prefix};
+            if (adapted.match.IsWhole())
+                byKinship.emplace(CommonStart(both).size(), std::move(adapted));
         }
     }
+    std::vector<ProfileChoice> whole;
+    for (auto& [kinship, adapted] : byKinship)
+        whole.push_back(std::move(adapted));
     return whole;
 }
 
@@ -106,18 +103,21 @@ std::vector<Candidate> AdaptedOnes(const std::vector<Candidate>& candidates, con
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
                                          CNode& targetRoot)
 {
-    const Skeletons skeletons(sourceRoot, targetRoot);
-    std::vector<Candidate> candidates = ReadCandidates(paths, skeletons);
-    const auto fits = [](const Candidate& candidate) { return candidate.choice.match.IsWhole(); };
-    if (std::ranges::none_of(candidates, fits))
-    {
-        std::vector<Candidate> adapted = AdaptedOnes(candidates, skeletons);
-        std::ranges::move(adapted, std::back_inserter(candidates));
-    }
-    std::ranges::stable_sort(candidates, std::greater(), Rank);
+    CSkeletons skeletons(sourceRoot, targetRoot);
     std::vector<ProfileChoice> choices;
-    for (Candidate& candidate : candidates)
-        choices.push_back(std::move(candidate.choice));
+    for (const std::string& path : paths)
+    {
+        ProfileChoice choice;
+        choice.path = path;
+        if (!ReadProfileRows(path, choice.profile))
+            continue;
+        skeletons.Hold(choice);
+        choices.push_back(std::move(choice));
+    }
+    const auto fits = [](const ProfileChoice& choice) { return choice.match.IsWhole(); };
+    if (std::ranges::none_of(choices, fits))
+        std::ranges::move(AdaptedOnes(choices, skeletons), std::back_inserter(choices));
+    std::ranges::stable_sort(choices, std::greater(), Rank);
     return choices;
 }
 

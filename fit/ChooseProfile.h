@@ -12,11 +12,9 @@ namespace gw {
 /// One profile, held against a source.
 struct ProfileChoice
 {
-    std::string path; ///< of the profile's file
-    std::string name; ///< display name; tells the prefix where the profile was adapted to one
-    /// The bytes of the profile as adapted to the prefix of the source's names; empty where the file serves
-    /// as it is.
-    std::string text;
+    std::string path;     ///< of the profile's file
+    ProfileRows profile;  ///< what the file says, or what became of it
+    bool adapted = false; ///< rows and name are those for the prefix of the source's names, not the file's
     RowMatch match;
     ProfileVerdict verdict; ///< of a profile whose rows all fit
 };

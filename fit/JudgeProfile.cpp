@@ -1,7 +1,9 @@
 #include "JudgeProfile.h"
 
 #include "BodyJoints.h"
+#include "BodyTree.h"
 #include "CRetargeter.h"
+#include "FindBodyByNames.h"
 #include "RowTurns.h"
 #include "Skeleton.h"
 
@@ -19,12 +21,14 @@ bool IsOneOf(const std::vector<CNode*>& joints, const CNode* joint)
     return std::ranges::find(joints, joint) != joints.end();
 }
 
-// The same place for a profile: of several necks any will do, and of a spine the rows tell none.
+// The same place for a profile: of several necks any will do, and no row tells a toe or which joints are a
+// spine's.
 bool IsSamePlace(const BodyPlace& place, const CBodyMap& byNames, const CNode* joint)
 {
     if (place.joint == EBodyJoint::Neck)
         return IsOneOf(byNames.neck, joint);
-    return place.joint == EBodyJoint::Spine || JointAt(byNames, place) == joint;
+    return place.joint == EBodyJoint::Spine || place.joint == EBodyJoint::Toe ||
+           JointAt(byNames, place) == joint;
 }
 
 void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict& verdict)
@@ -35,6 +39,17 @@ void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict&
         CNode* const named = JointAt(byNames, place);
         if (joint && named && !IsSamePlace(place, byNames, joint))
             verdict.doubts.push_back({EProfileDoubt::OtherName, {}, joint, named});
+    }
+}
+
+// No row tells a toe, and what hangs from a foot need not be one: a middle foot may even point back.
+void TakeToes(const CBodyMap& byNames, CBodyMap& body)
+{
+    for (const EBodySide side : kBodySides)
+    {
+        CNode* const toe = byNames.Leg(side).toe;
+        if (IsAtOrBelow(toe, body.Leg(side).foot) && toe)
+            body.Leg(side).toe = toe;
     }
 }
 
@@ -62,21 +77,27 @@ void CheckTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& bod
 
 ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
 {
-    const auto isOfPlaces = [](const ProfileDoubt& doubt) { return doubt.kind == EProfileDoubt::Places; };
-    if (std::ranges::any_of(doubts, isOfPlaces))
+    // A body may well have odd proportions.
+    const auto isGrave = [](const ProfileDoubt& doubt) {
+        return doubt.kind == EProfileDoubt::Places && doubt.places != EBodyDoubt::OddLength;
+    };
+    if (std::ranges::any_of(doubts, isGrave))
         return ESureness::Doubtful;
     return doubts.empty() ? ESureness::Sure : ESureness::Likely;
 }
 
 } // namespace
 
-ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const CBodyMap& byNames)
+SourceBody::SourceBody(CNode& root) : byNames(FindBodyByNames(root)), tree(root) {}
+
+ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const SourceBody& source)
 {
-    const CBodyMap body = BodyOfTable(table, targetRoot);
+    CBodyMap body = BodyOfTable(table, targetRoot);
+    TakeToes(source.byNames, body);
     ProfileVerdict verdict;
-    for (const BodyDoubt& doubt : CheckBody(body))
-        verdict.doubts.push_back({EProfileDoubt::Places, doubt, doubt.joint, nullptr});
-    CompareNames(body, byNames, verdict);
+    for (const BodyDoubt& doubt : CheckBody(body, source.tree))
+        verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, JointAt(body, doubt.place), nullptr});
+    CompareNames(body, source.byNames, verdict);
     CheckSpine(body, table.SourceOf(FindNode(&targetRoot, "UpperTorso")), verdict);
     CheckTurns(table, targetRoot, body, verdict);
     verdict.sureness = SurenessOf(verdict.doubts);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CBodyMap.h"
+#include "CJointTree.h"
 #include "CheckBody.h"
 
 #include <cstddef>
@@ -23,7 +24,7 @@ enum class ESureness : uint8_t
 /// What speaks against a profile.
 enum class EProfileDoubt : uint8_t
 {
-    Places,    ///< a body of these joints cannot be; see `body`
+    Places,    ///< a body of these joints cannot be; see `places`
     OtherName, ///< by its name the joint has another part in the body, which `other` has here
     SpineCut,  ///< spine joints above the one that drives the upper torso are left out
     Turned,    ///< the bone comes out turned across, about a quarter turn or more
@@ -38,9 +39,9 @@ constexpr bool IsOfRoles(EProfileDoubt kind)
 struct ProfileDoubt
 {
     EProfileDoubt kind = EProfileDoubt::Places;
-    BodyDoubt body;               ///< of Places
-    const CNode* joint = nullptr; ///< of the source
-    const CNode* other = nullptr; ///< of the source, or null
+    EBodyDoubt places = EBodyDoubt::NotBelow; ///< of Places
+    const CNode* joint = nullptr;             ///< of the source
+    const CNode* other = nullptr;             ///< of the source, or null
 };
 
 /// What is told of a profile whose rows all fit.
@@ -52,7 +53,16 @@ struct ProfileVerdict
     double turn = 0.0;  ///< mean angle in degrees that the bones come out turned across
 };
 
-/// Judges the rows that a retargeter was told. `byNames` is the source's body as FindBodyByNames reads it.
-ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const CBodyMap& byNames);
+/// What is looked at of a source for every profile that is judged.
+struct SourceBody
+{
+    explicit SourceBody(CNode& root);
+
+    CBodyMap byNames; ///< as the names of the joints tell
+    CJointTree tree;  ///< and how they lie
+};
+
+/// Judges the rows that a retargeter was told.
+ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const SourceBody& source);
 
 } // namespace gw

@@ -24,21 +24,21 @@ struct LeadRow
 };
 
 constexpr LeadRow kLeads[] = {
-    {"LowerTorso", nullptr    },
+    {"LowerTorso", nullptr     },
     {"Waist",      "UpperTorso"},
-    {"UpperTorso", nullptr    },
-    {"Neck",       "Head"     },
-    {"Head",       nullptr    },
-    {"LCollar",    "LUpperArm"},
-    {"LUpperArm",  "LForearm" },
-    {"LForearm",   "LHand"    },
-    {"LHand",      nullptr,     true},
-    {"LFoot",      nullptr    },
-    {"RCollar",    "RUpperArm"},
-    {"RUpperArm",  "RForearm" },
-    {"RForearm",   "RHand"    },
-    {"RHand",      nullptr,     true},
-    {"RFoot",      nullptr    },
+    {"UpperTorso", nullptr     },
+    {"Neck",       "Head"      },
+    {"Head",       nullptr     },
+    {"LCollar",    "LUpperArm" },
+    {"LUpperArm",  "LForearm"  },
+    {"LForearm",   "LHand"     },
+    {"LHand",      nullptr,      true},
+    {"LFoot",            nullptr                 },
+    {"RCollar",            "RUpperArm"},
+    {"RUpperArm",            "RForearm"               },
+    {"RForearm",            "RHand"},
+    {"RHand",            nullptr,                   true},
+    {"RFoot",        nullptr },
 };
 
 // A row of the table, with what its direction needs.
@@ -85,7 +85,8 @@ Mat3 ShortestTurn(const Vec3& from, const Vec3& to)
     const Vec3 axis = Vec3Cross(from, to);
     if (Vec3Length(axis) < 1e-6)
         return Vec3Dot(from, to) > 0.0 ? kMat3Identity : Mat3FromAxisAngle(kVec3UnitZ, kPi);
-    return Mat3FromAxisAngle(Vec3Normalized(axis), static_cast<float>(SafeAcos(static_cast<float>(Vec3Dot(from, to)))));
+    return Mat3FromAxisAngle(Vec3Normalized(axis),
+                             static_cast<float>(SafeAcos(static_cast<float>(Vec3Dot(from, to)))));
 }
 
 double DegreesBetweenRotations(const Mat3& a, const Mat3& b)
@@ -121,9 +122,8 @@ double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses)
 
 bool HasLimbs(const CBodyMap& body)
 {
-    return std::ranges::all_of(kBodySides, [&](EBodySide side) {
-        return body.Arm(side).upperArm && body.Leg(side).thigh;
-    });
+    return std::ranges::all_of(
+        kBodySides, [&](EBodySide side) { return body.Arm(side).upperArm && body.Leg(side).thigh; });
 }
 
 } // namespace

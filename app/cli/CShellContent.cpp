@@ -146,7 +146,8 @@ bool CShellContent::KeepStockPick(const std::string& source)
     const std::string path[] = {ProfilePath()};
     for (ProfileChoice& choice : HoldAgainstSource(path))
     {
-        std::erase_if(choice.verdict.doubts, [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
+        std::erase_if(choice.verdict.doubts,
+                      [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
         for (const CReport& warning : DoubtWarnings(source, choice))
             m_kWindow.Report(warning);
     }
@@ -163,15 +164,15 @@ bool CShellContent::Take(const std::string& source, const ProfileChoice& choice)
     for (const CReport& warning : DoubtWarnings(source, choice))
         m_kWindow.Report(warning);
     m_kChosen = choice;
-    if (!choice.text.empty())
+    if (choice.adapted)
         return SelectAdapted(choice);
-    SelectProfileByName(choice.name);
+    SelectProfileByName(choice.profile.name);
     return true;
 }
 
 bool CShellContent::SelectAdapted(const ProfileChoice& choice)
 {
-    if (m_kAdapted.Write(choice.text))
+    if (m_kAdapted.Write(TextOf(choice.profile)))
         return SelectProfile(m_kAdapted.Path());
     m_kWindow.Report(ShellFailure(choice.path, "adapted", "the profile cannot be kept in a temporary file"));
     return false;

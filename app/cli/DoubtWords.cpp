@@ -14,20 +14,37 @@ namespace {
 
 constexpr const char* kSurenessNames[] = {"sure", "likely", "doubtful"};
 
-const char* DoubtName(const ProfileDoubt& doubt)
+// A name for programs, and the sentence around the joint's name for people.
+struct DoubtText
 {
-    switch (doubt.kind)
-    {
-    case EProfileDoubt::Places:
-        return "places";
-    case EProfileDoubt::OtherName:
-        return "other-name";
-    case EProfileDoubt::SpineCut:
-        return "spine-cut";
-    case EProfileDoubt::Turned:
-        return "turned";
-    }
-    return "";
+    const char* name;
+    const char* before;
+    const char* between; // the joint and another one; null where there is no other
+    const char* behind;
+};
+
+// In the order of EBodyDoubt.
+constexpr DoubtText kPlaceTexts[] = {
+    {"not-below",       "",                            nullptr, " does not hang from the joint that should carry it" },
+    {"sides-swapped",   "",                            nullptr, " lies on the other side: left and right are swapped"},
+    {"clavicle-is-arm", "",                            nullptr, " lies a joint too far out for an upper arm"         },
+    {"arm-is-clavicle", "",                            nullptr, " is too short for an upper arm and looks a clavicle"},
+    {"legs-up",         "",                            nullptr, " goes up as the trunk does, and is no leg"          },
+    {"odd-length",      "the lengths of the limb of ", nullptr, " are odd"                                           },
+};
+
+// In the order of EProfileDoubt, behind the first one.
+constexpr DoubtText kTexts[] = {
+    {"other-name", "it takes ",                " where ", " is the joint by its name"},
+    {"spine-cut",  "the spine goes on above ", " up to ", ""                         },
+    {"turned",     "",                         nullptr,   " comes out turned across" },
+};
+
+const DoubtText& TextOf(const ProfileDoubt& doubt)
+{
+    if (doubt.kind == EProfileDoubt::Places)
+        return kPlaceTexts[static_cast<size_t>(doubt.places)];
+    return kTexts[static_cast<size_t>(doubt.kind) - 1];
 }
 
 std::string_view NameOf(const CNode* joint)
@@ -37,20 +54,9 @@ std::string_view NameOf(const CNode* joint)
 
 std::string Sentence(const ProfileDoubt& doubt)
 {
-    const std::string joint = Quoted(NameOf(doubt.joint));
-    const std::string other = Quoted(NameOf(doubt.other));
-    switch (doubt.kind)
-    {
-    case EProfileDoubt::Places:
-        return "a body of these joints is odd at " + joint;
-    case EProfileDoubt::OtherName:
-        return "it takes " + joint + " where " + other + " is the joint by its name";
-    case EProfileDoubt::SpineCut:
-        return "the spine goes on above " + joint + " up to " + other;
-    case EProfileDoubt::Turned:
-        return "the bone of " + joint + " comes out turned across";
-    }
-    return {};
+    const DoubtText& text = TextOf(doubt);
+    const std::string other = text.between ? text.between + Quoted(NameOf(doubt.other)) : "";
+    return text.before + Quoted(NameOf(doubt.joint)) + other + text.behind;
 }
 
 // Bones that come out turned are many where one is, and share a sentence.
@@ -65,7 +71,7 @@ std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
         joints += (count > 0 ? ", " : "") + Quoted(NameOf(doubt.joint));
         ++count;
     }
-    return count == 0 ? "" : "these bones come out turned across: " + joints;
+    return count == 0 ? "" : "these bones come out turned across, which --align may mend: " + joints;
 }
 
 } // namespace
@@ -93,7 +99,8 @@ std::vector<CReport> DoubtWarnings(const std::string& source, const ProfileChoic
     std::vector<CReport> warnings;
     for (const std::string& words : DoubtWords(choice.verdict))
     {
-        warnings.push_back(ShellFailure(source, "doubt", "profile " + Quoted(choice.name) + ": " + words));
+        warnings.push_back(
+            ShellFailure(source, "doubt", "profile " + Quoted(choice.profile.name) + ": " + words));
         warnings.back().warning = true;
     }
     return warnings;
@@ -101,7 +108,7 @@ std::vector<CReport> DoubtWarnings(const std::string& source, const ProfileChoic
 
 CReport DoubtfulReport(const std::string& source, const ProfileChoice& choice)
 {
-    std::string words = "the profile that fits best, " + Quoted(choice.name) + ", is doubtful";
+    std::string words = "the profile that fits best, " + Quoted(choice.profile.name) + ", is doubtful";
     for (const std::string& doubt : DoubtWords(choice.verdict))
         words += "\n  " + doubt;
     words += "\n  name it with --profile to use it all the same, or draft one with 'gaitwright suggest'";
@@ -117,7 +124,7 @@ void WriteVerdict(CJsonWriter& json, const ProfileVerdict& verdict)
     for (const ProfileDoubt& doubt : verdict.doubts)
     {
         json.BeginObject();
-        json.Key("kind").Text(DoubtName(doubt));
+        json.Key("kind").Text(TextOf(doubt).name);
         json.Key("joint").Text(NameOf(doubt.joint));
         json.Key("other").Text(NameOf(doubt.other));
         json.Key("words").Text(Sentence(doubt));

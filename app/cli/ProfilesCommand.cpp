@@ -37,7 +37,8 @@ std::vector<Entry> Installed(CShellContent& content)
 
 CProfileFit FitOf(const CShellContent& content, const ProfileChoice& choice)
 {
-    CProfileFit fit{choice.name, choice.match.rowCount, choice.match.foundCount, choice.match.drivesRoot, {}};
+    CProfileFit fit{
+        choice.profile.name, choice.match.rowCount, choice.match.foundCount, choice.match.drivesRoot, {}};
     if (!choice.match.IsWhole())
         content.Measure(choice.path, fit);
     return fit;
@@ -52,7 +53,7 @@ std::vector<Entry> ByFit(CShellContent& content)
     {
         const auto profile = std::ranges::find(installed, choice.path, &CInstalledProfile::path);
         const bool stock = profile != installed.end() && profile->stock;
-        entries.push_back({choice.name, choice.path, stock, FitOf(content, choice), {}});
+        entries.push_back({choice.profile.name, choice.path, stock, FitOf(content, choice), {}});
         if (choice.match.IsWhole())
             entries.back().verdict = choice.verdict;
     }
@@ -67,8 +68,8 @@ std::string Missing(const CProfileFit& fit)
 
 void Print(const Entry& entry)
 {
-    std::string line = Printable(entry.name) + " (" + (entry.stock ? "stock" : "own") + ", " +
-                       Printable(entry.path) + ')';
+    std::string line =
+        Printable(entry.name) + " (" + (entry.stock ? "stock" : "own") + ", " + Printable(entry.path) + ')';
     if (entry.fit)
         line += ": " + FitSummary(*entry.fit);
     if (entry.verdict)
