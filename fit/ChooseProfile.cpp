@@ -10,6 +10,7 @@
 #include <functional>
 #include <map>
 #include <optional>
+#include <set>
 #include <tuple>
 
 namespace gw {
@@ -63,17 +64,38 @@ auto Rank(const ProfileChoice& choice)
                       -static_cast<double>(verdict.leftOut), -verdict.turn);
 }
 
-ProfileChoice Adapted(const ProfileChoice& choice, const std::string& ownPrefix, const std::string& prefix)
+ProfileChoice Adapted(const ProfileChoice& choice, const std::string& oldPrefix, const std::string& newPrefix)
 {
     ProfileChoice adapted = choice;
     adapted.adapted = true;
-    adapted.profile.rows = WithPrefix(choice.profile.rows, ownPrefix, prefix);
-    adapted.profile.name += prefix.empty() ? ", no prefix" : ", prefix " + prefix;
+    adapted.profile.rows = WithPrefix(choice.profile.rows, oldPrefix, newPrefix);
+    adapted.profile.name += newPrefix.empty() ? ", no prefix" : ", prefix " + newPrefix;
     return adapted;
 }
 
+// A prefix before what a profile's names are, and in place of a prefix of their own.
+std::vector<ProfileChoice> AdaptedOnes(const ProfileChoice& choice, const std::vector<std::string>& prefixes,
+                                       CSkeletons& skeletons)
+{
+    std::set<std::string> oldPrefixes{"", SourcePrefix(choice.profile.rows)};
+    std::vector<ProfileChoice> whole;
+    for (const std::string& oldPrefix : oldPrefixes)
+    {
+        for (const std::string& newPrefix : prefixes)
+        {
+            if (EqualNoCase(oldPrefix, newPrefix))
+                continue;
+            whole.push_back(Adapted(choice, oldPrefix, newPrefix));
+            skeletons.Hold(whole.back());
+            if (!whole.back().match.IsWhole())
+                whole.pop_back();
+        }
+    }
+    return whole;
+}
+
 // Those with much of the source's prefix as their own come first: their names say most about it.
-std::vector<ProfileChoice> AdaptedOnes(const std::vector<ProfileChoice>& choices, CSkeletons& skeletons)
+std::vector<ProfileChoice> AdaptToPrefix(const std::vector<ProfileChoice>& choices, CSkeletons& skeletons)
 {
     std::vector<std::string> prefixes = SharedPrefixes(skeletons.SourceNames());
     prefixes.emplace_back();
@@ -81,19 +103,12 @@ std::vector<ProfileChoice> AdaptedOnes(const std::vector<ProfileChoice>& choices
     for (const ProfileChoice& choice : choices)
     {
         const std::string ownPrefix = SourcePrefix(choice.profile.rows);
-        for (const std::string& prefix : prefixes)
-        {
-            if (EqualNoCase(prefix, ownPrefix))
-                continue;
-            ProfileChoice adapted = Adapted(choice, ownPrefix, prefix);
-            skeletons.Hold(adapted);
-            const std::array<std::string_view, 2> both{ownPrefix, prefix};
-            if (adapted.match.IsWhole())
-                byKinship.emplace(CommonStart(both).size(), std::move(adapted));
-        }
+        const std::array<std::string_view, 2> both{ownPrefix, prefixes.front()};
+        for (ProfileChoice& adapted : AdaptedOnes(choice, prefixes, skeletons))
+            byKinship.emplace(CommonStart(both).size(), std::move(adapted));
     }
     std::vector<ProfileChoice> whole;
-    for (auto& [kinship, adapted] : byKinship)
+    for (auto& [length, adapted] : byKinship)
         whole.push_back(std::move(adapted));
     return whole;
 }
@@ -116,7 +131,7 @@ std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNo
     }
     const auto fits = [](const ProfileChoice& choice) { return choice.match.IsWhole(); };
     if (std::ranges::none_of(choices, fits))
-        std::ranges::move(AdaptedOnes(choices, skeletons), std::back_inserter(choices));
+        std::ranges::move(AdaptToPrefix(choices, skeletons), std::back_inserter(choices));
     std::ranges::stable_sort(choices, std::greater(), Rank);
     return choices;
 }

@@ -42,14 +42,21 @@ void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict&
     }
 }
 
-// No row tells a toe, and what hangs from a foot need not be one: a middle foot may even point back.
-void TakeToes(const CBodyMap& byNames, CBodyMap& body)
+void TakeNamed(CNode* named, const CNode* above, CNode*& joint)
+{
+    if (named && IsAtOrBelow(named, above))
+        joint = named;
+}
+
+// No row tells a toe, and what hangs from a foot need not be one: a middle foot may even point back. Some
+// profiles leave out hands, without which one cannot tell how long a forearm is.
+void AddUntold(const CBodyMap& byNames, CBodyMap& body)
 {
     for (const EBodySide side : kBodySides)
     {
-        CNode* const toe = byNames.Leg(side).toe;
-        if (IsAtOrBelow(toe, body.Leg(side).foot) && toe)
-            body.Leg(side).toe = toe;
+        TakeNamed(byNames.Leg(side).toe, body.Leg(side).foot, body.Leg(side).toe);
+        if (!body.Arm(side).hand)
+            TakeNamed(byNames.Arm(side).hand, body.Arm(side).forearm, body.Arm(side).hand);
     }
 }
 
@@ -93,7 +100,7 @@ SourceBody::SourceBody(CNode& root) : byNames(FindBodyByNames(root)), tree(root)
 ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const SourceBody& source)
 {
     CBodyMap body = BodyOfTable(table, targetRoot);
-    TakeToes(source.byNames, body);
+    AddUntold(source.byNames, body);
     ProfileVerdict verdict;
     for (const BodyDoubt& doubt : CheckBody(body, source.tree))
         verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, JointAt(body, doubt.place), nullptr});

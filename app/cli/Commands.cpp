@@ -22,7 +22,10 @@ constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | 
 constexpr CCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
         "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
-        "Without --profile the stock profile that fits is taken, else the installed one that fits best.\n"
+        "Without --profile the stock profile that fits is taken, else the installed one that fits best: all\n"
+        "rows must fit, most rows win. It is told which one and how sure it is; one whose left and right, or\n"
+        "whose arm and clavicle, lie wrong is only taken by its name. A prefix that the names of the source\n"
+        "share (Model_, mixamorig3:) is put before those of the profile.\n"
         "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.",
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
     Row("batch", "FOLDER", kJob | kProfile, kJob, RunBatchFolder,
@@ -59,7 +62,10 @@ constexpr CCommand kCommands[] = {
         "the motion; it is examined in turn, and the exit code is that of the copy.",
         "gaitwright doctor walk.bvh --fix mended.bvh"),
     Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
-        "List the installed profiles; with a source, which fit and what the others miss.",
+        "List the installed profiles; with a source, which fit and what the others miss.\n"
+        "The first one is what 'convert' takes. Those that fit tell how sure they are (sure, likely, doubtful)\n"
+        "and what speaks against them; of the others, those that fit by half tell what they miss, and --json\n"
+        "tells it of all.",
         "gaitwright profiles walk.bvh"),
     Row("suggest", "SOURCE", kOutput | kForce, kOutput, RunSuggest,
         "Make a profile for a skeleton that no installed one fits.\n"

@@ -59,19 +59,24 @@ std::string Sentence(const ProfileDoubt& doubt)
     return text.before + Quoted(NameOf(doubt.joint)) + other + text.behind;
 }
 
-// Bones that come out turned are many where one is, and share a sentence.
+// Bones that come out turned are many where one is: they share a sentence, and few of them are named.
 std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
 {
+    constexpr size_t kNamed = 4;
     std::string joints;
     size_t count = 0;
     for (const ProfileDoubt& doubt : doubts)
     {
         if (doubt.kind != EProfileDoubt::Turned)
             continue;
-        joints += (count > 0 ? ", " : "") + Quoted(NameOf(doubt.joint));
+        if (count < kNamed)
+            joints += (count > 0 ? ", " : "") + Quoted(NameOf(doubt.joint));
         ++count;
     }
-    return count == 0 ? "" : "these bones come out turned across, which --align may mend: " + joints;
+    if (count == 0)
+        return {};
+    const std::string more = count > kNamed ? " and " + std::to_string(count - kNamed) + " more" : "";
+    return "bones come out turned across, which --align may mend: " + joints + more;
 }
 
 } // namespace

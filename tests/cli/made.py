@@ -65,6 +65,42 @@ def bvh(old, new):
     return BVH.replace(old, new, 1)
 
 
+def body(prefix="", spine=3, swapped=False, family="Spine"):
+    """A human body in a T-pose that looks along z, in cm, by the names that most recorders give. Swapped, the
+    left names lie on the right. The other family calls its spine Chest and its limbs by their joints."""
+    arm, leg = {"Spine": (("Shoulder", "Arm", "ForeArm", "Hand"), ("UpLeg", "Leg", "Foot", "ToeBase")),
+                "Chest": (("Collar", "Shoulder", "Elbow", "Wrist"), ("Hip", "Knee", "Ankle", "Toe"))}[family]
+
+    def joint(name, offset, *below):
+        text = "JOINT %s%s\n{\nOFFSET %g %g %g\nCHANNELS 3 Zrotation Xrotation Yrotation\n" % (prefix, name, *offset)
+        end = "End Site\n{\nOFFSET %g %g %g\n}\n" % tuple(offset)
+        return text + ("".join(below) or end) + "}\n"
+
+    def chain(names, offsets):
+        below = ()
+        for name, offset in reversed(list(zip(names, offsets))):
+            below = (joint(name, offset, *below),)
+        return below[0]
+
+    def sides(names, offsets):
+        for side in (1, -1):
+            word = "Left" if (side == 1) != swapped else "Right"
+            yield chain([word + name for name in names], [(side * x, y, z) for x, y, z in offsets])
+
+    top = [*sides(arm, [(4, 14, 0), (14, 0, 0), (28, 0, 0), (26, 0, 0)]),
+           chain(["Neck", "Head"], [(0, 20, 0), (0, 9, 0)])]
+    first = 0 if family == "Spine" else 1
+    for number in reversed(range(spine)):
+        name = family if number == 0 else "%s%d" % (family, number + first)
+        top = [joint(name, (0, 30 / spine, 0), *top)]
+    legs = sides(leg, [(9, -4, 0), (0, -42, 0), (0, -42, 0), (0, -7, 13)])
+    hips = joint("Hips", (0, 0, 0), *legs, *top).replace("JOINT", "ROOT", 1)
+    hips = hips.replace("CHANNELS 3", "CHANNELS 6 Xposition Yposition Zposition", 1)
+    count = hips.count("CHANNELS")
+    row = "0 95 0" + " 0 0 0" * count + "\n"
+    return "HIERARCHY\n" + hips + "MOTION\nFrames: 3\nFrame Time: 0.0333333\n" + 3 * row
+
+
 def htr(old, new):
     assert HTR.count(old) >= 1, old
     return HTR.replace(old, new, 1)

@@ -47,10 +47,8 @@ std::string CNamedBody::NameFor(std::string name, float side) const
 {
     const bool isLeft = (side > 0.0f) != (m_kChange.names == BodyChange::SidesSwapped);
     const std::string word = Words(m_kConvention.sides)[isLeft ? 0 : 1];
-    if (const size_t star = name.find('*'); star != name.npos)
-        name.replace(star, 1, word);
-    else if (const size_t plus = name.find('+'); plus != name.npos)
-        name.replace(plus, 1, isLeft ? "L" : "R");
+    if (const size_t star = name.find_first_of("*+"); star != name.npos)
+        name = name.substr(0, star) + (name[star] == '*' ? word : isLeft ? "L" : "R") + name.substr(star + 1);
     name = m_kChange.prefix + name;
     if (m_kChange.letters == BodyChange::AsTheyAre)
         return name;

@@ -10,7 +10,8 @@
 
 namespace gw {
 
-/// What a source of motions calls the joints of a body. Lists go upward or outward, with blanks in between and
+/// What a source of motions calls the joints of a body. Lists go upward or outward, with blanks in between
+/// and
 /// "-" for a joint that is not there. In names of a side, * stands for the side's word, + for its letter.
 struct Convention
 {

@@ -49,7 +49,7 @@ const ProfileChoice& Taken(const std::vector<ProfileChoice>& choices, bool& isOl
     for (const char* old : {"PoserBVH.prf", "MaxBVH.prf"})
     {
         const auto found = std::ranges::find(choices, std::string(kAssets) + old, &ProfileChoice::path);
-        isOld = found != choices.end() && found->match.IsWhole();
+        isOld = found != choices.end() && found->match.IsWhole() && !found->adapted;
         if (isOld)
             return *found;
     }

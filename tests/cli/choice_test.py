@@ -1,0 +1,95 @@
+"""Which profile a conversion takes when none is named, and what is told of it."""
+import json
+
+from harness import ASSETS, DONE, FAILED, CliTest, main
+from made import body
+
+STRAIGHT = "MotionBuilder / HumanIK (3 spine joints)"
+
+
+class Choice(CliTest):
+    def setUp(self):
+        super().setUp()
+        (self.folder / "temp").mkdir()
+        self.environment["TMPDIR"] = str(self.folder / "temp")
+
+    def test_a_prefix_is_told_and_gives_the_same_bytes(self):
+        self.write("plain.bvh", body())
+        self.succeed("convert", "plain.bvh", "-o", "plain.htr", "--profile", STRAIGHT)
+        for prefix in ("", "Model_", "Skeleton:", "mixamorig5:", "DEF-"):
+            with self.subTest(prefix):
+                self.write("a.bvh", body(prefix))
+                told = json.loads(self.succeed("convert", "a.bvh", "-o", "a.htr", "--force", "--json").out)
+                self.assertEqual(told["profile"], STRAIGHT + (", prefix %s" % prefix if prefix else ""))
+                self.assertEqual(told["profilePath"], str(ASSETS / "HumanIK03.prf"))
+                self.assertEqual((told["sureness"], told["doubts"], told["warnings"]), ("sure", [], []))
+                self.assertEqual(self.read("a.htr"), self.read("plain.htr"))
+        self.assertEqual([name for name in self.files() if name.startswith("temp/")], [])
+
+    def test_without_a_place_for_temporary_files_that_is_said(self):
+        self.environment["TMPDIR"] = str(self.folder / "nowhere")
+        self.write("a.bvh", body("Model_"))
+        result = self.with_assets("convert", "a.bvh", "-o", "a.htr")
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["temporary"])
+        self.assertNotIn("a.htr", self.files())
+
+    def test_a_doubtful_profile_is_taken_only_by_name(self):
+        self.write("a.bvh", body(swapped=True))
+        result = self.with_assets("convert", "a.bvh", "-o", "a.htr")
+        self.assertEqual((result.code, result.out), (FAILED, ""))
+        self.assert_words(result, ["doubtful", "left and right", '"LeftUpLeg"', "--profile", "gaitwright suggest"])
+        self.assertNotIn("a.htr", self.files())
+        self.assertIn("LaFAN1", self.succeed("convert", "a.bvh", "-o", "a.htr", "--profile", "LaFAN1 (3 spine joints)").out)
+
+    def test_a_doubt_about_a_profile_of_old_is_a_warning(self):
+        self.write("a.bvh", body(family="Chest", swapped=True))
+        result = self.succeed("convert", "a.bvh", "-o", "a.htr")
+        self.assert_words(result, ["warning", "Max BVH", "left and right"])
+        self.assertTrue(result.out.endswith('by profile "Max BVH"\n'), result.out)
+        self.succeed("convert", "a.bvh", "-o", "named.htr", "--profile", "Max BVH")
+        self.assertEqual(self.read("a.htr"), self.read("named.htr"))
+        self.write("b.bvh", body(family="Chest"))
+        self.assertEqual(self.succeed("convert", "b.bvh", "-o", "b.htr").err, "")
+
+    def test_spine_joints_beyond_every_profile_are_told(self):
+        self.write("a.bvh", body(spine=12))
+        result = self.succeed("convert", "a.bvh", "-o", "a.htr")
+        self.assertIn("10 spine joints", result.out)
+        self.assertIn(", likely", result.out)
+        self.assert_words(result, ['the spine goes on above "Spine9" up to "Spine11"'])
+
+    def test_profiles_are_listed_as_they_are_taken(self):
+        rows = [  # what, source, the first profile's name, its sureness, kinds of doubt
+            ("the best fit", body(spine=2), "MotionBuilder / HumanIK (2 spine joints)", "sure", set()),
+            ("a prefix", body("Model_", spine=2), "MotionBuilder / HumanIK (2 spine joints), prefix Model_", "sure", set()),
+            ("a profile of old", body(family="Chest", spine=2), "Max BVH", None, None),
+            ("a doubtful one", body(swapped=True), None, "doubtful", {"sides-swapped"}),
+        ]
+        for what, source, name, sureness, kinds in rows:
+            with self.subTest(what):
+                self.write("a.bvh", source)
+                told = json.loads(self.succeed("profiles", "a.bvh", "--json").out)["profiles"]
+                first = told[0]
+                self.assertTrue(first["fits"])
+                self.assertEqual(first["name"], name or first["name"])
+                self.assertEqual(first["sureness"], sureness or first["sureness"])
+                if kinds is not None:
+                    self.assertLessEqual(kinds, {doubt["kind"] for doubt in first["doubts"]})
+                taken = self.with_assets("convert", "a.bvh", "--dry-run", "--json")
+                if taken.code == DONE:
+                    self.assertEqual(json.loads(taken.out)["profile"], first["name"])
+                fits = [row["fits"] for row in told]
+                self.assertEqual(fits, sorted(fits, reverse=True))
+                self.assertIn(first["name"], self.succeed("profiles", "a.bvh").out.splitlines()[0])
+
+    def test_a_batch_takes_the_adapted_profile_for_every_file(self):
+        for name in ("one", "two"):
+            self.write("takes/%s.bvh" % name, body("Model_"))
+        self.succeed("batch", "takes", "--job", "htr")
+        self.assertEqual(self.read("takes/one.htr"), self.read("takes/two.htr"))
+        self.assertEqual([name for name in self.files() if name.startswith("temp/")], [])
+
+
+if __name__ == "__main__":
+    main()

@@ -1,0 +1,271 @@
+#include "CNamedBody.h"
+#include "ChooseProfile.h"
+#include "Paths.h"
+#include "SharedPrefix.h"
+#include "Skeleton.h"
+#include "TempFolder.h"
+
+#include <gmock/gmock.h>
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kAssets = GAITWRIGHT_ASSETS;
+constexpr Convention kHumanIK{"HumanIK",
+                              "Left Right",
+                              "Hips Spine Spine1",
+                              "Neck Head",
+                              "*Shoulder *Arm *ForeArm *Hand",
+                              "- *UpLeg *Leg *Foot *ToeBase"};
+
+std::vector<std::string> StockPaths()
+{
+    std::vector<std::string> paths;
+    for (const std::string& file : FilesInFolder(std::string(kAssets), ".prf"))
+        paths.push_back(std::string(kAssets) + file);
+    return paths;
+}
+
+class Choose : public testing::Test
+{
+protected:
+    Choose() { EXPECT_TRUE(m_kTarget.Load(std::string(kAssets) + "base.htr")); }
+
+    std::vector<ProfileChoice> Of(CNode& source, const std::vector<std::string>& paths = StockPaths())
+    {
+        return ChooseProfile(paths, source, *m_kTarget.motionRoot);
+    }
+    /// Writes a profile that drives the hips and what else is told.
+    std::string Profile(const std::string& name, const std::string& rows)
+    {
+        const std::string path = m_kFolder.Path(name + ".prf");
+        WriteBytes(path, name + "\nFrameRate 30\nPosition 0 0 0\nHips <---> LowerTorso 0,0,0,1,2,3\n" + rows);
+        return path;
+    }
+    static std::vector<std::string> Names(const std::vector<ProfileChoice>& choices)
+    {
+        std::vector<std::string> names;
+        for (const ProfileChoice& choice : choices)
+            names.push_back(choice.profile.name);
+        return names;
+    }
+
+    CTempFolder m_kFolder;
+    CMotionFile m_kTarget;
+};
+
+TEST_F(Choose, OfEqualRowsTheRestPoseDecides)
+{
+    const struct
+    {
+        const char* what;
+        BodyChange change;
+        const char* name;
+    } rows[] = {
+        {"a hand of one bone", {"plain"},                    "MotionBuilder / HumanIK (2 spine joints)"},
+        {"a hand of fingers",
+         {"fingers", "", BodyChange::AsTheyAre, true, true},
+         "MotionBuilder / HumanIK (2 spine joints, fingers)"                                           },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CNamedBody body(kHumanIK, row.change);
+        const std::vector<ProfileChoice> choices = Of(body.Root());
+        EXPECT_EQ(choices.front().profile.name, row.name);
+        EXPECT_EQ(choices.front().verdict.sureness, ESureness::Sure);
+        EXPECT_LT(choices.front().verdict.turn, 5.0);
+    }
+}
+
+TEST_F(Choose, AHandThatWouldStandAcrossIsTold)
+{
+    const CNamedBody body(kHumanIK, {"fingers", "", BodyChange::AsTheyAre, true, true});
+    const std::vector<ProfileChoice> choices = Of(body.Root(), {std::string(kAssets) + "HumanIK02.prf"});
+    std::vector<std::string> turned;
+    for (const ProfileDoubt& doubt : choices.front().verdict.doubts)
+        turned.emplace_back(doubt.kind == EProfileDoubt::Turned ? doubt.joint->NameView() : "another doubt");
+    EXPECT_THAT(turned, testing::ElementsAre("LeftHand", "RightHand"));
+    EXPECT_EQ(choices.front().verdict.sureness, ESureness::Likely);
+}
+
+TEST_F(Choose, MoreRowsGoFirstThenTheOrderGivenThenWhatFitsInPart)
+{
+    const CNamedBody body(kHumanIK, {"plain"});
+    const std::string chest = "Spine1 <---> UpperTorso 0,0,0,1,2,3\n";
+    const std::vector<std::string> paths = {
+        Profile("half", chest + "Skull <---> Head 0,0,0,1,2,3\n"),
+        Profile("few", ""),
+        Profile("first", chest),
+        m_kFolder.Path("none.prf"),
+        Profile("second", chest),
+        Profile("third", "Bone1 <---> Head 0\nBone2 <---> Neck 0\nBone3 <---> LHand 0\n"),
+    };
+    EXPECT_THAT(Names(Of(body.Root(), paths)),
+                testing::ElementsAre("first", "second", "few", "half", "third"));
+}
+
+TEST_F(Choose, AProfileWithoutTheRootBoneFitsNothing)
+{
+    const CNamedBody body(kHumanIK, {"plain"});
+    const std::string path = m_kFolder.Path("rootless.prf");
+    WriteBytes(path, "Rootless\nSpine1 <---> UpperTorso 0,0,0\n");
+    EXPECT_FALSE(Of(body.Root(), {path}).front().match.IsWhole());
+    WriteBytes(path, std::string("Zero\0\n* \n\n<--->\n", 16));
+    EXPECT_FALSE(Of(body.Root(), {path}).front().match.IsWhole());
+}
+
+TEST_F(Choose, APrefixIsTriedOnlyWhereNothingFits)
+{
+    const CNamedBody body(kHumanIK, {"a prefix", "Model_"});
+    std::vector<std::string> paths = StockPaths();
+    EXPECT_TRUE(Of(body.Root(), paths).front().adapted);
+    WriteBytes(m_kFolder.Path("own.prf"), "Own\nModel_Hips <---> LowerTorso 0\n");
+    paths.push_back(m_kFolder.Path("own.prf"));
+    const std::vector<ProfileChoice> choices = Of(body.Root(), paths);
+    EXPECT_EQ(choices.front().profile.name, "Own");
+    EXPECT_EQ(std::ranges::count(choices, true, &ProfileChoice::adapted), 0);
+}
+
+TEST_F(Choose, APrefixOfTheProfileMayBeMissingInTheNames)
+{
+    const CNamedBody body(kHumanIK, {"plain"});
+    const std::string mixamo = std::string(kAssets) + "HumanIK02.prf";
+    std::string text = ReadBytes(mixamo);
+    for (size_t at = text.find("Hips"); at != text.npos; at = text.find(" <---> ", at + 16))
+    {
+        if (text[at] == ' ')
+            at = text.rfind('\n', at) + 1;
+        if (text[at] != '*')
+            text.insert(at, "Figure:");
+    }
+    WriteBytes(m_kFolder.Path("prefixed.prf"), text);
+    const ProfileChoice best = Of(body.Root(), {m_kFolder.Path("prefixed.prf")}).front();
+    EXPECT_TRUE(best.match.IsWhole());
+    EXPECT_THAT(best.profile.name, testing::EndsWith(", no prefix"));
+}
+
+TEST_F(Choose, TheSourceStandsAsItStoodBefore)
+{
+    const CNamedBody body(kHumanIK, {"plain"});
+    std::vector<CNode*> nodes = NodesOf(body.Root());
+    for (size_t i = 0; i < nodes.size(); ++i) // as some frame may have left it
+        nodes[i]->m_kMatrix.m[12] = nodes[i]->m_kWorldMatrix.m[13] = static_cast<float>(i);
+    Of(body.Root());
+    for (size_t i = 0; i < nodes.size(); ++i)
+    {
+        EXPECT_EQ(nodes[i]->m_kMatrix.m[12], static_cast<float>(i)) << nodes[i]->NameView();
+        EXPECT_EQ(nodes[i]->m_kWorldMatrix.m[13], static_cast<float>(i)) << nodes[i]->NameView();
+    }
+}
+
+TEST(SharedPrefix, NearlyAllNamesMustHaveIt)
+{
+    const std::string body = "Hips Spine Neck Head LeftArm RightArm LeftLeg RightLeg ";
+    const struct
+    {
+        const char* what;
+        const char* prefix;
+        const char* others;
+        std::vector<std::string> prefixes;
+    } rows[] = {
+        {"none",                       "",          "",                   {}            },
+        {"an underscore",              "Model_",    "",                   {"Model_"}    },
+        {"a namespace in a namespace", "a:b:",      "",                   {"a:b:", "a:"}},
+        {"no separator",               "mixamorig", "",                   {"mixamorig"} },
+        {"a root outside",             "Model_",    "Armature",           {"Model_"}    },
+        {"many outside",               "Model_",    "Sword Shield Horse", {}            },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        std::vector<std::string> names;
+        std::istringstream words(body);
+        for (std::string word; words >> word;)
+            names.push_back(row.prefix + word);
+        std::istringstream others(row.others);
+        for (std::string word; others >> word;)
+            names.push_back(word);
+        EXPECT_EQ(SharedPrefixes(names), row.prefixes);
+    }
+    EXPECT_TRUE(SharedPrefixes(std::vector<std::string>{"a_b", "a_c"}).empty());
+    EXPECT_TRUE(SharedPrefixes({}).empty());
+}
+
+// Real motions of many makers: what is taken, or why not.
+TEST_F(Choose, RealMotions)
+{
+    const std::string folder = SharedDataFolder();
+    if (folder.empty())
+        return;
+    const struct
+    {
+        const char* file;
+        const char* name; ///< empty where nothing fits
+        ESureness sureness;
+    } rows[] = {
+        {"bandai_walk_normal_002", "Bandai Namco (2 spine joints)",                              ESureness::Sure  },
+        {"cmu_cgspeed_example",    "CMU, MotionBuilder names (3 spine joints, fingers)",         ESureness::Sure  },
+        {"daz3d_genesis",          "DAZ Genesis 3 and 8 (4 spine joints, fingers)",              ESureness::Sure  },
+        {"fair1_dab",              "MotionBuilder / HumanIK (4 spine joints, leaning, fingers)", ESureness::Likely},
+        {"fingers60_crlf",         "MotionBuilder / HumanIK (4 spine joints, curved, fingers)",  ESureness::Likely},
+        {"geno_stance",            "MotionBuilder / HumanIK (4 spine joints, leaning)",          ESureness::Likely},
+        {"julia_example",          "",                                                           ESureness::Sure  },
+        {"m21_female_walk",        "MotionBuilder / HumanIK, 21 joints (2 spine joints)",        ESureness::Likely},
+        {"makehuman_tpose",        "",                                                           ESureness::Sure  },
+        {"makehuman_walk1",        "",                                                           ESureness::Sure  },
+        {"mixamo_freebvh",         "Mixamo (3 spine joints, fingers)",                           ESureness::Sure  },
+        {"pymo_walk_120hz",        "MotionBuilder / HumanIK without neck (1 spine joint)",       ESureness::Likely},
+        {"rokoko_jesse_dance",     "Rokoko Studio, HumanIK (3 spine joints)",                    ESureness::Likely},
+        {"rotation_first_root",    "",                                                           ESureness::Sure  },
+        {"two_joints",             "",                                                           ESureness::Sure  },
+        {"walk01_leftupleg",       "MotionBuilder / HumanIK (2 spine joints, leaning)",          ESureness::Sure  },
+        {"xzy_leftupleg",          "MotionBuilder / HumanIK (4 spine joints)",                   ESureness::Likely},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.file);
+        CMotionFile source;
+        ASSERT_TRUE(source.Load(folder + "bvh/" + row.file + ".bvh"));
+        const ProfileChoice best = Of(*source.motionRoot).front();
+        EXPECT_EQ(best.match.IsWhole() ? best.profile.name : "", row.name);
+        if (*row.name)
+            EXPECT_EQ(best.verdict.sureness, row.sureness);
+    }
+}
+
+// The two stock profiles of old are taken where they fit, so that a false alarm would be a daily nuisance.
+TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
+{
+    const std::string folder = SharedDataFolder();
+    const struct
+    {
+        const char* file;
+        const char* profile;
+    } rows[] = {
+        {"cmu1_jumping_jacks",    "MaxBVH.prf"  },
+        {"mocapbank_lefthip",     "MaxBVH.prf"  },
+        {"yxz_lefthip",           "MaxBVH.prf"  },
+        {"poser_boxing",          "PoserBVH.prf"},
+        {"poser_pose1",           "PoserBVH.prf"},
+        {"poser_tpose_one_frame", "PoserBVH.prf"},
+    };
+    for (const auto& row : rows)
+    {
+        if (folder.empty())
+            return;
+        SCOPED_TRACE(row.file);
+        CMotionFile source;
+        ASSERT_TRUE(source.Load(folder + "bvh/" + row.file + ".bvh"));
+        const ProfileChoice choice = Of(*source.motionRoot, {std::string(kAssets) + row.profile}).front();
+        EXPECT_TRUE(choice.match.IsWhole());
+        for (const ProfileDoubt& doubt : choice.verdict.doubts)
+            EXPECT_FALSE(IsOfRoles(doubt.kind)) << doubt.joint->NameView();
+    }
+}
+
+} // namespace
+
+} // namespace gw
