@@ -8,6 +8,7 @@
 #include "Skeleton.h"
 
 #include <algorithm>
+#include <cmath>
 #include <optional>
 
 namespace gw {
@@ -20,25 +21,25 @@ struct LeadRow
 {
     const char* bone;
     const char* next; ///< null for none
-    bool isHand = false;
+    bool isHand;      ///< leads to its own fingers
 };
 
 constexpr LeadRow kLeads[] = {
-    {"LowerTorso", nullptr     },
-    {"Waist",      "UpperTorso"},
-    {"UpperTorso", nullptr     },
-    {"Neck",       "Head"      },
-    {"Head",       nullptr     },
-    {"LCollar",    "LUpperArm" },
-    {"LUpperArm",  "LForearm"  },
-    {"LForearm",   "LHand"     },
-    {"LHand",      nullptr,      true},
-    {"LFoot",            nullptr                 },
-    {"RCollar",            "RUpperArm"},
-    {"RUpperArm",            "RForearm"               },
-    {"RForearm",            "RHand"},
-    {"RHand",            nullptr,                   true},
-    {"RFoot",        nullptr },
+    {"LowerTorso", nullptr,      false},
+    {"Waist",      "UpperTorso", false},
+    {"UpperTorso", nullptr,      false},
+    {"Neck",       "Head",       false},
+    {"Head",       nullptr,      false},
+    {"LCollar",    "LUpperArm",  false},
+    {"LUpperArm",  "LForearm",   false},
+    {"LForearm",   "LHand",      false},
+    {"LHand",      nullptr,      true },
+    {"LFoot",      nullptr,      false},
+    {"RCollar",    "RUpperArm",  false},
+    {"RUpperArm",  "RForearm",   false},
+    {"RForearm",   "RHand",      false},
+    {"RHand",      nullptr,      true },
+    {"RFoot",      nullptr,      false},
 };
 
 // A row of the table, with what its direction needs.
@@ -93,7 +94,8 @@ double DegreesBetweenRotations(const Mat3& a, const Mat3& b)
 {
     const Mat3 difference = a * Mat3Transpose(b);
     const float trace = difference.m[0] + difference.m[4] + difference.m[8];
-    return SafeAcos((trace - 1.0f) / 2.0f) * kRadiansToDegrees64;
+    // Places near the end of 32 bits give no number; such a bone stands as wrong as can be.
+    return std::isfinite(trace) ? SafeAcos((trace - 1.0f) / 2.0f) * kRadiansToDegrees64 : 180.0;
 }
 
 // Where the source's bone leads to in the body's own axes; nothing where joints coincide.

@@ -15,6 +15,7 @@ namespace {
 // GAITWRIGHT_ASSETS is the folder of the stock profiles.
 constexpr std::string_view kAssets = GAITWRIGHT_ASSETS;
 
+// clang-format off
 constexpr BodyChange kRightChanges[] = {
     {"as it is"},
     {"a prefix", "Model_"},
@@ -33,6 +34,7 @@ constexpr BodyChange kWrongChanges[] = {
     {"clavicle and arm exchanged", "", BodyChange::AsTheyAre, true, false, BodyChange::ArmsExchanged},
     {"clavicle names an arm", "", BodyChange::AsTheyAre, true, false, BodyChange::ArmsShifted},
 };
+// clang-format on
 
 enum class EOutcome
 {
@@ -88,7 +90,8 @@ protected:
     EOutcome Try(const Convention& convention, const BodyChange& change)
     {
         const CNamedBody body(convention, change);
-        const std::vector<ProfileChoice> choices = ChooseProfile(m_kPaths, body.Root(), *m_kTarget.motionRoot);
+        const std::vector<ProfileChoice> choices =
+            ChooseProfile(m_kPaths, body.Root(), *m_kTarget.motionRoot);
         bool isOld = false;
         const ProfileChoice& taken = Taken(choices, isOld);
         const EOutcome outcome = Judge(taken, body, isOld);
