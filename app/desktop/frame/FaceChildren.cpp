@@ -5,11 +5,13 @@
 #include "CTitleLabel.h"
 #include "QtText.h"
 
+#include <QAbstractItemView>
 #include <QComboBox>
 #include <QCoreApplication>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QPainter>
+#include <QScrollBar>
 
 namespace gw {
 
@@ -66,10 +68,26 @@ QWidget* MakeView(const CLeftKeys& keys, QWidget* face)
     return words;
 }
 
+// A list that is as wide as its texts, under a field that is as wide as the skin says: what tells profiles of
+// a family apart stands at the end of their names.
+class CProfileField : public QComboBox
+{
+public:
+    using QComboBox::QComboBox;
+    void showPopup() override
+    {
+        view()->setMinimumWidth(view()->sizeHintForColumn(0) +
+                                view()->verticalScrollBar()->sizeHint().width());
+        QComboBox::showPopup();
+    }
+};
+
 QWidget* MakeCombo(QWidget* face)
 {
-    auto* const combo = new QComboBox(face);
+    auto* const combo = new CProfileField(face);
     combo->setMaxVisibleItems(kMostVisibleProfiles);
+    combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
+    combo->setMinimumContentsLength(1);
     return combo;
 }
 
