@@ -85,6 +85,26 @@ std::optional<double> CommonF1(const std::vector<FootMeasures>& feet)
     return RatioOf(2.0 * static_cast<double>(both), static_cast<double>(standing));
 }
 
+// One number of a leg's postures, frame by frame: (number - floor) x scale.
+std::vector<float> Curve(const CLegTrack& leg, float CLegTrack::Posture::*number, double floor = 0.0,
+                         double scale = 1.0)
+{
+    std::vector<float> curve;
+    curve.reserve(leg.Postures().size());
+    for (const CLegTrack::Posture& posture : leg.Postures())
+        curve.push_back(static_cast<float>((static_cast<double>(posture.*number) - floor) * scale));
+    return curve;
+}
+
+// The height on which the soles of a skeleton stand.
+double SoleFloor(const std::vector<CLegTrack>& legs)
+{
+    std::vector<float> heights;
+    for (const CLegTrack& leg : legs)
+        std::ranges::transform(leg.Postures(), std::back_inserter(heights), &CLegTrack::Posture::soleHeight);
+    return static_cast<double>(Percentile(std::move(heights), kFloorShare));
+}
+
 } // namespace
 
 CFeetTrack::CFeetTrack(const std::vector<LegJoints>& legs)
@@ -157,7 +177,23 @@ void CFeetMeter::Add()
     m_kResult.Append();
 }
 
-void CFeetMeter::Write(ConversionMeasures& measures, double secondsPerFrame) const
+void CFeetMeter::WriteDetail(ConversionDetail& detail, const LegContacts& source,
+                             const LegContacts& result) const
+{
+    const double scale = ResultLeg() / SourceLeg();
+    detail.sourceFloor = SoleFloor(m_kSource.Legs());
+    for (size_t i = 0; i < m_kPairs.size(); ++i)
+    {
+        const CLegTrack& from = m_kSource.Legs()[i];
+        const CLegTrack& to = m_kResult.Legs()[i];
+        detail.feet.push_back({Curve(from, &CLegTrack::Posture::soleHeight, detail.sourceFloor, scale),
+                               Curve(to, &CLegTrack::Posture::soleHeight),
+                               Curve(from, &CLegTrack::Posture::kneeAngle),
+                               Curve(to, &CLegTrack::Posture::kneeAngle), source[i], result[i]});
+    }
+}
+
+void CFeetMeter::Write(ConversionMeasures& measures, double secondsPerFrame, ConversionDetail* detail) const
 {
     if (!IsLength(SourceLeg()) || !IsLength(ResultLeg()))
         return;
@@ -176,6 +212,8 @@ void CFeetMeter::Write(ConversionMeasures& measures, double secondsPerFrame) con
     measures.contactF1 = CommonF1(measures.feet);
     measures.floorHeight = FloorHeight(m_kResult, resultContacts);
     measures.sinkDepth = SinkDepth(m_kResult.Legs());
+    if (detail)
+        WriteDetail(*detail, sourceContacts, resultContacts);
 }
 
 } // namespace gw

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "ConversionDetail.h"
 #include "ConversionMeasures.h"
 #include "FindContacts.h"
 #include "Legs.h"
@@ -48,10 +49,14 @@ public:
     void Add();
     double SourceLeg() const { return m_kSource.LegLength(); }
     double ResultLeg() const { return m_kResult.LegLength(); }
-    /// Enters all figures of legs and ground. `secondsPerFrame` is the source's.
-    void Write(ConversionMeasures& measures, double secondsPerFrame) const;
+    /// Enters all figures of legs and ground. `secondsPerFrame` is the source's. `detail`, where there is
+    /// one, takes the curves.
+    void Write(ConversionMeasures& measures, double secondsPerFrame, ConversionDetail* detail) const;
 
 private:
+    using LegContacts = std::vector<std::vector<Contact>>;
+    void WriteDetail(ConversionDetail& detail, const LegContacts& source, const LegContacts& result) const;
+
     std::vector<LegPair> m_kPairs;
     CFeetTrack m_kSource;
     CFeetTrack m_kResult;

@@ -65,6 +65,7 @@ struct FootMeasures
     /// negative.
     double addedSlideMean = 0.0;         ///< mean over the contacts, mm
     double addedSlideLargest = 0.0;      ///< of one contact, mm
+    int addedSlideFrame = 0;             ///< in which the result's ankle is farthest off in that contact
     double addedSlideMeanShare = 0.0;    ///< mean, in leg lengths
     double addedSlideLargestShare = 0.0; ///< largest, in leg lengths
     double sourceSlideShare = 0.0;       ///< mean slide of the source, in its leg lengths
@@ -81,6 +82,8 @@ struct FootMeasures
     /// Knee: the angle between thigh and calf, 0 for a straight leg. A pop is a frame into which it changes
     /// by over 10 degrees more than the source's knee does.
     size_t kneePops = 0;
+    std::vector<int> kneePopFrames; ///< which these are
+    int kneePopFrame = 0;           ///< the frame of the next figure
     double kneePopLargest = 0.0; ///< most by which the change of one frame exceeds the source's; at least 0
     double kneeChangeLargest = 0.0; ///< largest change from one frame to the next
     double sourceKneeChangeLargest = 0.0;

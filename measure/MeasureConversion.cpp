@@ -6,12 +6,14 @@
 #include "MeasureConversion.h"
 
 #include "CBoneMeter.h"
+#include "CDetailRecorder.h"
 #include "CFeetMeter.h"
 #include "CMotionFile.h"
 #include "CPoseSampler.h"
 #include "FrameScale.h"
 
 #include <algorithm>
+#include <optional>
 
 namespace gw {
 
@@ -77,10 +79,11 @@ BoneMeasures NamedBone(const BonePair& pair, const BoneEnds& ends)
 class CComparison
 {
 public:
-    CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs);
+    CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs,
+                ConversionDetail* detail);
 
     void Run();
-    ConversionMeasures Measures() const;
+    ConversionMeasures Measures();
 
 private:
     void WatchPair(const BonePair& pair, const BoneEnds& ends);
@@ -98,18 +101,26 @@ private:
     std::vector<size_t> m_kMeteredBones; // which these are
     CFeetMeter m_kFeet;
     CTravelMeter m_kTravel;
+    ConversionDetail* m_pkDetail; // null where nobody asks
+    std::optional<CDetailRecorder> m_kRecorder;
 };
 
-CComparison::CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs)
+CComparison::CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs,
+                         ConversionDetail* detail)
     : m_fFrameScale(FrameScaleOf(source.frameCount, result.frameCount)),
       m_fSecondsPerFrame(IsFrameTime(source.frequency) ? source.frequency : kUsualSecondsPerFrame),
       m_iFrameCount(ComparedFrames(source.frameCount, result.frameCount, m_fFrameScale)), m_kSources(pairs),
       m_kSource(source.frequency), m_kResult(result.frequency), m_kFeet(FindLegs(pairs, m_kSources)),
-      m_kTravel(m_kSources.SourceOf(result.root), result.root)
+      m_kTravel(m_kSources.SourceOf(result.root), result.root), m_pkDetail(detail)
 {
     PlanBones(pairs);
     m_kFeet.WatchJoints(m_kSource, m_kResult);
     m_kFeet.Begin();
+    if (!detail)
+        return;
+    *detail = {};
+    detail->secondsPerFrame = m_fSecondsPerFrame;
+    m_kRecorder.emplace(*detail, pairs, m_kSources, result.root);
 }
 
 void CComparison::PlanBones(std::span<const BonePair> pairs)
@@ -144,6 +155,8 @@ void CComparison::Run()
             meter.Add();
         m_kFeet.Add();
         m_kTravel.Add();
+        if (m_kRecorder)
+            m_kRecorder->Add();
     }
 }
 
@@ -168,14 +181,16 @@ void CComparison::WriteBones(ConversionMeasures& measures) const
     measures.jitterRatio = RatioOf(measures.resultJitter, measures.sourceJitter, kStillJitter);
 }
 
-ConversionMeasures CComparison::Measures() const
+ConversionMeasures CComparison::Measures()
 {
     ConversionMeasures measures;
     measures.frameCount = m_iFrameCount;
     measures.frameScale = m_fFrameScale;
     WriteBones(measures);
-    m_kFeet.Write(measures, m_fSecondsPerFrame);
+    m_kFeet.Write(measures, m_fSecondsPerFrame, m_pkDetail);
     m_kTravel.Write(measures);
+    if (m_kRecorder)
+        m_kRecorder->Finish(measures);
     return measures;
 }
 
@@ -192,13 +207,13 @@ MotionClip ClipOf(const CMotionFile& file)
 }
 
 ConversionMeasures MeasureConversion(const MotionClip& source, const MotionClip& result,
-                                     std::span<const BonePair> pairs)
+                                     std::span<const BonePair> pairs, ConversionDetail* detail)
 {
     if (!HasFrames(source) || !HasFrames(result))
         return {};
     source.root->UpdateTransform(0.0f);
     result.root->UpdateTransform(0.0f);
-    CComparison comparison(source, result, pairs);
+    CComparison comparison(source, result, pairs, detail);
     comparison.Run();
     return comparison.Measures();
 }

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "BonePairs.h"
+#include "ConversionDetail.h"
 #include "ConversionMeasures.h"
 
 #include <span>
@@ -23,8 +24,8 @@ MotionClip ClipOf(const CMotionFile& file);
 
 /// Measures a conversion at every frame of the source; frame f there is frame f x FrameScaleOf(...) of the
 /// result. Both trees are posed and stay as the last frame left them. A clip without a root or frames gives a
-/// record without figures.
+/// record without figures. `detail`, where there is one, is made anew and takes what happens frame by frame.
 ConversionMeasures MeasureConversion(const MotionClip& source, const MotionClip& result,
-                                     std::span<const BonePair> pairs);
+                                     std::span<const BonePair> pairs, ConversionDetail* detail = nullptr);
 
 } // namespace gw

@@ -81,15 +81,25 @@ void MeasureSoles(const FootSide& source, const FootSide& result, FootMeasures& 
     foot.sourceSoleTiltMean = SoleTilts(source.track, source.contacts).Mean();
 }
 
-// How far the ankle goes from where a contact begins, in leg lengths.
-double SlideShare(const FootSide& side, const Contact& contact)
+struct Slide
+{
+    double share = 0.0; // in leg lengths
+    int frame = 0;
+};
+
+// How far the ankle goes from where a contact begins.
+Slide SlideIn(const FootSide& side, const Contact& contact)
 {
     const std::vector<Vec3>& ankles = side.track.Ankles();
-    double slide = 0.0;
+    Slide slide{0.0, contact.first};
     for (int f = contact.first; f < contact.end; ++f)
-        slide = std::max(slide, GroundDistance(ankles[static_cast<size_t>(contact.first)],
-                                               ankles[static_cast<size_t>(f)]));
-    return slide / side.leg;
+    {
+        const double distance =
+            GroundDistance(ankles[static_cast<size_t>(contact.first)], ankles[static_cast<size_t>(f)]);
+        if (distance / side.leg > slide.share)
+            slide = {distance / side.leg, f};
+    }
+    return slide;
 }
 
 void MeasureSlide(const FootSide& source, const FootSide& result, FootMeasures& foot)
@@ -99,11 +109,14 @@ void MeasureSlide(const FootSide& source, const FootSide& result, FootMeasures& 
     CRunningMean added;
     for (const Contact& contact : source.contacts)
     {
-        const double sourceSlide = SlideShare(source, contact);
-        const double resultSlide = SlideShare(result, contact);
+        const double sourceSlide = SlideIn(source, contact).share;
+        const Slide resultSlide = SlideIn(result, contact);
+        const double addedSlide = resultSlide.share - sourceSlide;
+        if (added.Count() == 0 || addedSlide > added.Largest())
+            foot.addedSlideFrame = resultSlide.frame;
         sourceSlides.Add(sourceSlide);
-        resultSlides.Add(resultSlide);
-        added.Add(resultSlide - sourceSlide);
+        resultSlides.Add(resultSlide.share);
+        added.Add(addedSlide);
     }
     foot.sourceSlideShare = sourceSlides.Mean();
     foot.resultSlideShare = resultSlides.Mean();
@@ -140,11 +153,17 @@ void MeasureKnee(const FootSide& source, const FootSide& result, FootMeasures& f
     {
         const double sourceChange = change(source, f);
         const double resultChange = change(result, f);
-        foot.kneePops += resultChange - sourceChange > kPopDegrees ? 1 : 0;
-        foot.kneePopLargest = std::max(foot.kneePopLargest, resultChange - sourceChange);
+        if (resultChange - sourceChange > kPopDegrees)
+            foot.kneePopFrames.push_back(static_cast<int>(f));
+        if (resultChange - sourceChange > foot.kneePopLargest)
+        {
+            foot.kneePopLargest = resultChange - sourceChange;
+            foot.kneePopFrame = static_cast<int>(f);
+        }
         foot.kneeChangeLargest = std::max(foot.kneeChangeLargest, resultChange);
         foot.sourceKneeChangeLargest = std::max(foot.sourceKneeChangeLargest, sourceChange);
     }
+    foot.kneePops = foot.kneePopFrames.size();
 }
 
 } // namespace

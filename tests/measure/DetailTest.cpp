@@ -1,0 +1,152 @@
+// What a comparison keeps frame by frame, and which frames it names.
+
+#include "CMadeFigure.h"
+#include "WorstFrames.h"
+
+#include <algorithm>
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+constexpr int kFrames = 120;
+
+const auto kStill = [](CMadeFigure&, int) {};
+
+struct Measured
+{
+    ConversionMeasures sums;
+    ConversionDetail detail;
+};
+
+template <class SourcePose, class ResultPose>
+Measured MeasureMoves(const SourcePose& sourcePose, const ResultPose& resultPose, double sourceUnit = 1.0)
+{
+    CMadeFigure source(sourceUnit);
+    CMadeFigure result;
+    Measured measured;
+    const MotionClip sourceClip = source.Record(kFrames, sourcePose);
+    const MotionClip resultClip = result.Record(kFrames, resultPose);
+    measured.sums = MeasureConversion(sourceClip, resultClip, PairByName(source, result), &measured.detail);
+    return measured;
+}
+
+const PartMeasures& PartOf(const ConversionDetail& detail, std::string_view name)
+{
+    static const PartMeasures kNone;
+    const auto found = std::ranges::find(detail.parts, name, &PartMeasures::name);
+    return found == detail.parts.end() ? kNone : *found;
+}
+
+} // namespace
+
+TEST(ConversionDetail, PartsTakeBothSidesTogether)
+{
+    const auto turned = [](CMadeFigure& figure, int frame) {
+        figure.Turn("LCalf", kVec3UnitX, frame == 50 ? 12.0 : 4.0);
+        figure.Turn("RCalf", kVec3UnitX, 2.0);
+        figure.Turn("Head", kVec3UnitX, 9.0); // an end joint: its bone's own axis is looked at
+    };
+    const ConversionDetail detail = MeasureMoves(kStill, turned).detail;
+    const PartMeasures& calf = PartOf(detail, "calf");
+    EXPECT_EQ(calf.boneCount, 2u);
+    ExpectMeasured(calf.meanError, (4.0 + 8.0 / kFrames + 2.0) / 2.0);
+    ExpectMeasured(calf.largestError, 12.0);
+    EXPECT_EQ(calf.largestBone, "LCalf");
+    EXPECT_EQ(calf.largestFrame, 50);
+    ExpectMeasured(PartOf(detail, "thigh").largestError, 0.0);
+    EXPECT_EQ(PartOf(detail, "head").boneCount, 1u);
+    ExpectMeasured(PartOf(detail, "head").meanError, 9.0);
+}
+
+// A part without a bone says so, and the curves of what is not mapped are empty.
+TEST(ConversionDetail, WhatIsNotMappedHasNoCurve)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    const std::vector<BonePair> pairs{
+        {&result.Bone("LHand"), &source.Bone("LHand")}
+    };
+    ConversionDetail detail;
+    const MotionClip clip = source.Record(5, kStill);
+    MeasureConversion(clip, result.Record(5, kStill), pairs, &detail);
+    EXPECT_EQ(PartOf(detail, "spine").boneCount, 0u);
+    EXPECT_TRUE(detail.meanError.empty() && detail.feet.empty() && detail.sourceRoot.empty());
+}
+
+// A source of half the size in metres that stands 300 mm above its origin; the result sinks by 20 mm.
+TEST(ConversionDetail, CurvesStandSideBySideInTheResultsUnit)
+{
+    const auto moved = [](float height, float step) {
+        return [=](CMadeFigure& figure, int frame) {
+            figure.Move("LowerTorso", {0.0f, height, step * static_cast<float>(frame)});
+            figure.Turn("LCalf", kVec3UnitX, -0.1 * frame); // forwards and up
+        };
+    };
+    const ConversionDetail detail = MeasureMoves(moved(300.0f, 4.0f), moved(-20.0f, 5.0f), 0.0005).detail;
+    ASSERT_EQ(detail.feet.size(), 2u);
+    EXPECT_NEAR(detail.feet[1].sourceSole[60], 0.0, 0.1);
+    EXPECT_NEAR(detail.feet[1].resultSole[60], -20.0, 0.1);
+    EXPECT_NEAR(detail.feet[0].sourceKnee[100], 10.0, 0.01);
+    EXPECT_NEAR(detail.feet[0].resultKnee[100], 10.0, 0.01);
+    ASSERT_EQ(detail.sourceRoot.size(), static_cast<size_t>(kFrames));
+    EXPECT_NEAR(detail.sourceRoot[100].z, 400.0, 0.1);
+    EXPECT_NEAR(detail.resultRoot[100].z, 500.0, 0.1);
+    EXPECT_NEAR(detail.sourceRoot[0].y, 900.0, 0.1);
+    EXPECT_NEAR(detail.resultRoot[0].y, 880.0, 0.1);
+}
+
+TEST(WorstFrames, AreThoseOfTheFaultsThatWereMade)
+{
+    const auto faulty = [](CMadeFigure& figure, int frame) {
+        figure.Turn("LForearm", kVec3UnitZ, frame == 20 ? 60.0 : 1.0);
+        figure.Turn("LCalf", kVec3UnitX, frame == 40 ? 14.0 : frame == 41 ? 2.0 : 0.0);
+        figure.Move("LowerTorso", {frame == 77 ? 150.0f : 0.0f, 0.0f, 0.0f});
+    };
+    const Measured measured = MeasureMoves(kStill, faulty);
+    const std::vector<WorstFrame> worst = FindWorstFrames(measured.sums, measured.detail, 3);
+    const struct
+    {
+        EFault fault;
+        int frame;
+        double amount;
+    } rows[] = {
+        {EFault::Direction, 20, 60.0 / static_cast<double>(measured.detail.mainBones.size())},
+        {EFault::KneePop,   40, 14.0                                                        },
+        {EFault::Slide,     77, 150.0                                                       },
+    };
+    ASSERT_EQ(worst.size(), std::size(rows));
+    for (size_t i = 0; i < worst.size(); ++i)
+    {
+        EXPECT_EQ(worst[i].fault, rows[i].fault);
+        EXPECT_EQ(worst[i].frame, rows[i].frame);
+        EXPECT_NEAR(worst[i].amount, rows[i].amount, 0.1);
+    }
+    EXPECT_EQ(worst[0].target, "LForearm");
+    EXPECT_NEAR(worst[0].most, 60.0, 0.1);
+    EXPECT_EQ(worst[1].target, "LFoot");
+    EXPECT_EQ(measured.sums.feet[0].kneePopFrames, (std::vector<int>{40, 41}));
+}
+
+TEST(WorstFrames, AreFilledUpWithDirectionsThatLieApart)
+{
+    const auto faulty = [](CMadeFigure& figure, int frame) {
+        figure.Turn("LForearm", kVec3UnitZ, 60.0 - std::min(std::abs(frame - 30), std::abs(frame - 90)));
+    };
+    const Measured measured = MeasureMoves(kStill, faulty);
+    const std::vector<WorstFrame> worst = FindWorstFrames(measured.sums, measured.detail, 4);
+    ASSERT_EQ(worst.size(), 4u);
+    for (size_t i = 0; i < worst.size(); ++i)
+    {
+        for (size_t j = i + 1; j < worst.size(); ++j)
+            EXPECT_GE(std::abs(worst[i].frame - worst[j].frame), 15) << i << ' ' << j;
+    }
+    EXPECT_EQ(std::min(worst[0].frame, worst[1].frame), 30);
+    EXPECT_EQ(std::max(worst[0].frame, worst[1].frame), 90);
+
+    const Measured same = MeasureMoves(kStill, kStill);
+    EXPECT_TRUE(FindWorstFrames(same.sums, same.detail, 3).empty()) << "nothing is bad";
+}
+
+} // namespace gw
