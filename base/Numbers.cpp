@@ -355,6 +355,15 @@ void AppendFixed3(std::string& out, float value)
     out.append(text, std::to_chars(text, std::end(text), value, std::chars_format::fixed, 3).ptr);
 }
 
+void AppendFixed(std::string& out, double value, int decimals)
+{
+    char text[384]; // the largest number has 309 digits
+    decimals = std::clamp(decimals, 0, 17);
+    char* const end = std::to_chars(text, std::end(text), value, std::chars_format::fixed, decimals).ptr;
+    const bool isZero = std::all_of(text, end, [](char c) { return c == '-' || c == '0' || c == '.'; });
+    out.append(isZero && *text == '-' ? text + 1 : text, end);
+}
+
 void AppendInt(std::string& out, int32_t value)
 {
     char text[kIntBytes];

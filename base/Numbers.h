@@ -48,6 +48,8 @@ char* WriteInt(char* out, int32_t value);
 void AppendFixed6(std::string& out, float value);
 /// The same with three decimals, as "%.3f" does, for what is only looked at.
 void AppendFixed3(std::string& out, float value);
+/// The same with any number of decimals, and without a sign before what rounds to 0.
+void AppendFixed(std::string& out, double value, int decimals);
 void AppendInt(std::string& out, int32_t value);
 
 } // namespace gw

@@ -40,6 +40,15 @@ private:
     uint64_t m_uiBits[4] = {};
 };
 
+// Whether a byte may stand behind a lead byte: three and four bytes could spell what fewer bytes spell, half
+// of a surrogate pair, or what is beyond the last code point.
+bool MayFollow(unsigned char lead, unsigned char second)
+{
+    const unsigned char least = lead == 0xe0 ? 0xa0 : lead == 0xf0 ? 0x90 : 0x80;
+    const unsigned char most = lead == 0xed ? 0x9f : lead == 0xf4 ? 0x8f : 0xbf;
+    return least <= second && second <= most;
+}
+
 // The bytes of the UTF-8 character at the front of a text, or 0 for what is none: a stray or cut sequence.
 size_t CharacterLength(std::string_view text)
 {
@@ -53,7 +62,7 @@ size_t CharacterLength(std::string_view text)
         length = 3;
     else if (lead >= 0xf0 && lead < 0xf5)
         length = 4;
-    if (length == 0 || text.size() < length)
+    if (length == 0 || text.size() < length || !MayFollow(lead, static_cast<unsigned char>(text[1])))
         return 0;
     const auto follows = [](char c) { return (static_cast<unsigned char>(c) & 0xc0) == 0x80; };
     return std::ranges::all_of(text.substr(1, length - 1), follows) ? length : 0;

@@ -97,16 +97,19 @@ TEST(Text, PrintableTextCommandsNoTerminal)
         const char* text;
         const char* printed;
     } rows[] = {
-        {"plain",                    "Hips 1",          "Hips 1"            },
-        {"letters beyond ASCII",     "Hüfte 腰 🦴", "Hüfte 腰 🦴"   },
-        {"escape sequence",          "\x1b[2J\x07\x7f", "\\x1b[2J\\x07\\x7f"},
-        {"line feed",                "a\n",             "a\\x0a"            },
-        {"control of two bytes",     "\xc2\x9b[2J",     "\\xc2\\x9b[2J"     },
-        {"no-break space is none",   "a\xc2\xa0 b",     "a\xc2\xa0 b"       },
-        {"stray byte",               "a\x9b[2J",        "a\\x9b[2J"         },
-        {"cut sequence",             "\xe8\x85",        "\\xe8\\x85"        },
-        {"sequence without its end", "\xe8\x1b[",       "\\xe8\\x1b["       },
-        {"overlong control",         "\xc0\x9b",        "\\xc0\\x9b"        },
+        {"plain",                    "Hips 1",           "Hips 1"              },
+        {"letters beyond ASCII",     "Hüfte 腰 🦴",  "Hüfte 腰 🦴"     },
+        {"escape sequence",          "\x1b[2J\x07\x7f",  "\\x1b[2J\\x07\\x7f"  },
+        {"line feed",                "a\n",              "a\\x0a"              },
+        {"control of two bytes",     "\xc2\x9b[2J",      "\\xc2\\x9b[2J"       },
+        {"no-break space is none",   "a\xc2\xa0 b",      "a\xc2\xa0 b"         },
+        {"stray byte",               "a\x9b[2J",         "a\\x9b[2J"           },
+        {"cut sequence",             "\xe8\x85",         "\\xe8\\x85"          },
+        {"sequence without its end", "\xe8\x1b[",        "\\xe8\\x1b["         },
+        {"overlong control",         "\xc0\x9b",         "\\xc0\\x9b"          },
+        {"overlong in three bytes",  "\xe0\x80\x9b",     "\\xe0\\x80\\x9b"     },
+        {"half of a surrogate pair", "\xed\xa0\x80",     "\\xed\\xa0\\x80"     },
+        {"no code point",            "\xf4\x90\x80\x80", "\\xf4\\x90\\x80\\x80"},
     };
     for (const auto& row : rows)
         EXPECT_EQ(Printable(row.text), row.printed) << row.what;

@@ -1,0 +1,202 @@
+#include "CConversionSection.h"
+
+#include "FigureDrawing.h"
+#include "Tables.h"
+
+#include <algorithm>
+#include <iterator>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kWorstFrames = 3;
+constexpr const char* kRightThigh = "RThigh";
+constexpr const char* kLeftThigh = "LThigh";
+
+std::vector<std::string> NamesOf(const std::vector<BoneMeasures>& bones, std::string BoneMeasures::*side)
+{
+    std::vector<std::string> names;
+    std::ranges::transform(bones, std::back_inserter(names), side);
+    return names;
+}
+
+void AppendFault(CMarkup& page, const WorstFrame& worst)
+{
+    switch (worst.fault)
+    {
+    case EFault::Direction:
+        page.Raw("main bones ").Number(worst.amount, 1).Raw("° off in the mean, most of all ");
+        page.Name(worst.target).Raw(", ").Number(worst.most, 1).Raw("°");
+        break;
+    case EFault::KneePop:
+        page.Raw("the knee above ").Name(worst.target).Raw(" jumps by ").Number(worst.amount, 1);
+        page.Raw("° more than the source's");
+        break;
+    case EFault::Slide:
+        page.Name(worst.target).Raw(" stands, and has slid ").Number(worst.amount, 1);
+        page.Raw(" mm farther than the source's");
+        break;
+    }
+}
+
+// The size of the source for pictures; without legs on both sides it stands as large as it is.
+double SourceScale(const ConversionMeasures& sums)
+{
+    return sums.sourceLeg > 0.0 && sums.resultLeg > 0.0 ? sums.resultLeg / sums.sourceLeg : 1.0;
+}
+
+std::vector<float> Heights(const std::vector<Vec3>& places)
+{
+    std::vector<float> heights;
+    std::ranges::transform(places, std::back_inserter(heights), &Vec3::y);
+    return heights;
+}
+
+void AddBothSides(Chart& chart, std::span<const float> source, std::span<const float> result)
+{
+    chart.curves.push_back({"source", "source", source});
+    chart.curves.push_back({"result", "result", result});
+}
+
+} // namespace
+
+CConversionSection::CConversionSection(const ConvertedMotion& motion, size_t mostPoints)
+    : m_kMotion(motion), m_uiMostPoints(mostPoints),
+      m_kWorst(FindWorstFrames(motion.measured->sums, motion.measured->detail, kWorstFrames))
+{
+    for (const WorstFrame& worst : m_kWorst)
+        m_kMarks.push_back({worst.frame, m_kMarks.size() + 1});
+}
+
+void CConversionSection::Append(CMarkup& page, const std::string& anchor)
+{
+    page.Raw("<section id=\"").Raw(anchor).Raw("\">\n");
+    AppendHead(page);
+    AppendTiles(page);
+    AppendWorstFrames(page);
+    page.Raw("<h3>Over time</h3>\n<div class=\"charts\">\n");
+    AppendCurves(page);
+    page.Raw("</div>\n<h3>Figures</h3>\n<div class=\"tables\">\n<div>\n");
+    AppendPartTable(page, *m_kMotion.measured, m_kMotion.plain);
+    AppendFootTable(page, *m_kMotion.measured);
+    page.Raw("</div>\n");
+    AppendBoneTable(page, *m_kMotion.measured, m_kMotion.plain);
+    page.Raw("</div>\n</section>\n");
+}
+
+void CConversionSection::AppendHead(CMarkup& page) const
+{
+    const ConversionMeasures& sums = m_kMotion.measured->sums;
+    page.Raw("<h2><span class=\"source\">").Name(m_kMotion.source).Raw("</span> → <span class=\"result\">");
+    page.Name(m_kMotion.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(m_kMotion.profile);
+    page.Raw(" · ").Integer(sums.frameCount).Raw(" frames compared · ");
+    page.Number(sums.frameCount * m_kMotion.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
+}
+
+void CConversionSection::AppendTiles(CMarkup& page) const
+{
+    const std::vector<KeyFigure> figures = KeyFiguresOf(m_kMotion.measured->sums, m_kMotion.measured->detail);
+    std::vector<KeyFigure> plain;
+    if (m_kMotion.plain)
+        plain = KeyFiguresOf(m_kMotion.plain->sums, m_kMotion.plain->detail);
+    page.Raw("<div class=\"tiles\">\n");
+    for (size_t i = 0; i < figures.size(); ++i)
+    {
+        const KeyFigure& figure = figures[i];
+        page.Raw("<div class=\"tile ").Raw(VerdictClass(figure.verdict)).Raw("\"><span>");
+        page.Raw(figure.label).Raw("</span><strong>");
+        AppendFigure(page, figure);
+        page.Raw("</strong><em>").Raw(VerdictSign(figure.verdict)).Raw(" ").Raw(VerdictWord(figure.verdict));
+        page.Raw("</em>");
+        if (!plain.empty())
+        {
+            page.Raw("<small class=\"plain\">plain rules ");
+            AppendFigure(page, plain[i]);
+            page.Raw("</small>");
+        }
+        page.Raw("<small>").Raw(figure.mark).Raw("</small></div>\n");
+    }
+    page.Raw("</div>\n");
+}
+
+void CConversionSection::AppendWorstFrames(CMarkup& page) const
+{
+    const ConversionMeasures& sums = m_kMotion.measured->sums;
+    CFigurePoser source(m_kMotion.sourceClip, NamesOf(sums.bones, &BoneMeasures::source));
+    CFigurePoser result(m_kMotion.resultClip, NamesOf(sums.bones, &BoneMeasures::target));
+    if (!m_kWorst.empty())
+        page.Raw("<h3>Worst frames</h3>\n<div class=\"worst\">\n");
+    for (size_t i = 0; i < m_kWorst.size(); ++i)
+    {
+        const WorstFrame& worst = m_kWorst[i];
+        FigurePair pair{source.Pose(worst.frame, worst.fault, worst.source),
+                        result.Pose(worst.frame * sums.frameScale, worst.fault, worst.target),
+                        result.Across(kRightThigh, kLeftThigh)};
+        PlaceFigure(pair.source, m_kMotion.measured->detail.sourceFloor, SourceScale(sums));
+        PlaceFigure(pair.result, 0.0, 1.0);
+        page.Raw("<article><p><b class=\"number\">").Integer(static_cast<long long>(i + 1));
+        page.Raw("</b> <b>Frame ").Integer(worst.frame).Raw("</b> ");
+        AppendFault(page, worst);
+        page.Raw("</p>\n");
+        AppendFigures(page, pair);
+        page.Raw("</article>\n");
+    }
+    if (!m_kWorst.empty())
+        page.Raw("</div>\n");
+}
+
+void CConversionSection::AppendCurves(CMarkup& page) const
+{
+    const ConversionDetail& detail = m_kMotion.measured->detail;
+    Chart chart = NewChart("Direction error", "°");
+    chart.fromZero = true;
+    if (m_kMotion.plain)
+        chart.curves.push_back({"plain rules, mean", "other", m_kMotion.plain->detail.meanError});
+    chart.curves.push_back({"farthest main bone", "most", detail.largestError});
+    chart.curves.push_back({"mean of the main bones", "result", detail.meanError});
+    AppendChart(page, chart, m_uiMostPoints);
+    for (size_t i = 0; i < detail.feet.size(); ++i)
+        AppendKnee(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
+    for (size_t i = 0; i < detail.feet.size(); ++i)
+        AppendSole(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
+    AppendRoot(page);
+}
+
+Chart CConversionSection::NewChart(const std::string& title, std::string_view unit) const
+{
+    Chart chart;
+    chart.title = title;
+    chart.unit = unit;
+    chart.marks = m_kMarks;
+    return chart;
+}
+
+void CConversionSection::AppendKnee(CMarkup& page, const FootDetail& foot, const std::string& name) const
+{
+    Chart chart = NewChart("Knee above " + name, "°, 0 is straight");
+    chart.fromZero = true;
+    AddBothSides(chart, foot.sourceKnee, foot.resultKnee);
+    AppendChart(page, chart, m_uiMostPoints);
+}
+
+void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const std::string& name) const
+{
+    Chart chart = NewChart("Sole of " + name, "mm above the floor");
+    chart.fromZero = true;
+    AddBothSides(chart, foot.sourceSole, foot.resultSole);
+    chart.strips.push_back({"source stands", "source", foot.sourceContacts});
+    chart.strips.push_back({"result stands", "result", foot.resultContacts});
+    AppendChart(page, chart, m_uiMostPoints);
+}
+
+void CConversionSection::AppendRoot(CMarkup& page) const
+{
+    const std::vector<float> source = Heights(m_kMotion.measured->detail.sourceRoot);
+    const std::vector<float> result = Heights(m_kMotion.measured->detail.resultRoot);
+    Chart chart = NewChart("Height of the root", "mm above the floor");
+    AddBothSides(chart, source, result);
+    AppendChart(page, chart, m_uiMostPoints);
+}
+
+} // namespace gw

@@ -1,0 +1,61 @@
+#include "CMarkup.h"
+
+#include "Numbers.h"
+#include "Text.h"
+
+#include <cstddef>
+
+namespace gw {
+
+namespace {
+
+constexpr size_t kLongestName = 300; // the system's own limit for the name of a file is 255
+
+std::string_view EscapeOf(char c)
+{
+    switch (c)
+    {
+    case '&':
+        return "&amp;";
+    case '<':
+        return "&lt;";
+    case '>':
+        return "&gt;";
+    case '"':
+        return "&quot;";
+    case '\'':
+        return "&#39;";
+    default:
+        return {};
+    }
+}
+
+} // namespace
+
+CMarkup& CMarkup::Name(std::string_view name)
+{
+    // A character that is cut in two shows its bytes.
+    for (const char c : Printable(name.substr(0, kLongestName)))
+    {
+        const std::string_view escape = EscapeOf(c);
+        if (escape.empty())
+            m_kText += c;
+        else
+            m_kText += escape;
+    }
+    return name.size() > kLongestName ? Raw("…") : *this;
+}
+
+CMarkup& CMarkup::Number(double value, int decimals)
+{
+    AppendFixed(m_kText, value, decimals);
+    return *this;
+}
+
+CMarkup& CMarkup::Integer(long long value)
+{
+    m_kText += std::to_string(value);
+    return *this;
+}
+
+} // namespace gw

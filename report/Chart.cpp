@@ -1,0 +1,189 @@
+// The drawing of a chart stretches with the page: its lines keep their width, and the numbers at its axes are
+// text of the page, so that they keep their size on a phone and on a wide screen alike.
+
+#include "Chart.h"
+
+#include "CAxis.h"
+#include "CMarkup.h"
+#include "ThinCurve.h"
+
+#include <algorithm>
+#include <cmath>
+#include <limits>
+#include <utility>
+
+namespace gw {
+
+namespace {
+
+constexpr double kWidth = 1000.0;
+constexpr double kHeight = 100.0;
+constexpr double kStripHeight = 5.0;
+constexpr int kHeightSteps = 3;
+constexpr int kFrameSteps = 6;
+
+struct ThinnedCurve
+{
+    const ChartCurve& curve;
+    std::vector<CurvePoint> points;
+};
+
+size_t FrameCount(const Chart& chart)
+{
+    size_t count = 0;
+    for (const ChartCurve& curve : chart.curves)
+        count = std::max(count, curve.values.size());
+    return count;
+}
+
+CAxis HeightAxis(const Chart& chart, const std::vector<ThinnedCurve>& curves)
+{
+    double least = chart.fromZero ? 0.0 : std::numeric_limits<double>::infinity();
+    double largest = chart.fromZero ? 0.0 : -std::numeric_limits<double>::infinity();
+    for (const ThinnedCurve& curve : curves)
+    {
+        for (const CurvePoint& point : curve.points)
+        {
+            least = std::min(least, static_cast<double>(point.value));
+            largest = std::max(largest, static_cast<double>(point.value));
+        }
+    }
+    return least <= largest ? CAxis(least, largest, kHeightSteps) : CAxis(0.0, 1.0, kHeightSteps);
+}
+
+// One chart on its way into the page.
+class CChartDrawing
+{
+public:
+    CChartDrawing(CMarkup& page, const Chart& chart, std::vector<ThinnedCurve> curves, size_t frameCount)
+        : m_kPage(page), m_kChart(chart), m_kCurves(std::move(curves)),
+          m_kHeight(HeightAxis(chart, m_kCurves)),
+          m_fLastFrame(std::max(1.0, static_cast<double>(frameCount) - 1.0))
+    {
+    }
+
+    void Draw()
+    {
+        m_kPage.Raw("<figure class=\"chart\"><figcaption><b>").Name(m_kChart.title).Raw("</b> ");
+        m_kPage.Raw(m_kChart.unit);
+        DrawLegend();
+        m_kPage.Raw("</figcaption>\n<div class=\"plot\">");
+        m_kPage.Raw("<svg viewBox=\"0 0 1000 100\" preserveAspectRatio=\"none\" role=\"img\" aria-label=\"");
+        m_kPage.Name(m_kChart.title).Raw(" over the frames\">");
+        DrawGrid();
+        DrawStrips();
+        DrawMarks();
+        for (const ThinnedCurve& curve : m_kCurves)
+            DrawCurve(curve);
+        m_kPage.Raw("</svg>");
+        LabelHeights();
+        LabelFrames();
+        LabelMarks();
+        m_kPage.Raw("</div></figure>\n");
+    }
+
+private:
+    double X(double frame) const { return frame / m_fLastFrame * kWidth; }
+    double Y(double value) const { return (1.0 - m_kHeight.Share(value)) * kHeight; }
+
+    void DrawLegend()
+    {
+        m_kPage.Raw("<span class=\"legend\">");
+        for (const ChartCurve& curve : m_kChart.curves)
+            m_kPage.Raw(" <i class=\"key ").Raw(curve.style).Raw("\"></i>").Raw(curve.name);
+        for (const ChartStrip& strip : m_kChart.strips)
+            m_kPage.Raw(" <i class=\"key strip ").Raw(strip.style).Raw("\"></i>").Raw(strip.name);
+        m_kPage.Raw("</span>");
+    }
+    void DrawGrid()
+    {
+        m_kPage.Raw("<path class=\"grid\" d=\"");
+        for (const double tick : m_kHeight.Ticks())
+            m_kPage.Raw("M0 ").Number(Y(tick), 2).Raw("H1000");
+        m_kPage.Raw("\"/>");
+    }
+    // The strips lie one over the other at the bottom, the first one highest.
+    void DrawStrips()
+    {
+        double top = kHeight - kStripHeight * static_cast<double>(m_kChart.strips.size());
+        for (const ChartStrip& strip : m_kChart.strips)
+        {
+            m_kPage.Raw("<path class=\"strip ").Raw(strip.style).Raw("\" d=\"");
+            for (const Contact& stretch : strip.stretches)
+            {
+                m_kPage.Raw("M").Number(X(stretch.first), 1).Raw(" ").Number(top, 1);
+                m_kPage.Raw("H").Number(X(stretch.end - 1), 1).Raw("v").Number(kStripHeight - 1.0, 1);
+                m_kPage.Raw("H").Number(X(stretch.first), 1).Raw("z");
+            }
+            m_kPage.Raw("\"/>");
+            top += kStripHeight;
+        }
+    }
+    void DrawMarks()
+    {
+        for (const ChartMark& mark : m_kChart.marks)
+            m_kPage.Raw("<path class=\"mark\" d=\"M").Number(X(mark.frame), 1).Raw(" 0V100\"/>");
+    }
+    void DrawCurve(const ThinnedCurve& curve)
+    {
+        m_kPage.Raw("<path class=\"curve ").Raw(curve.curve.style).Raw("\" d=\"");
+        const char* command = "M";
+        for (const CurvePoint& point : curve.points)
+        {
+            m_kPage.Raw(command).Number(X(point.frame), 1).Raw(" ");
+            m_kPage.Number(Y(static_cast<double>(point.value)), 1);
+            command = "L";
+        }
+        if (curve.points.size() == 1)
+            m_kPage.Raw("h1000"); // a pose without motion
+        m_kPage.Raw("\"/>");
+    }
+    void LabelHeights()
+    {
+        for (const double tick : m_kHeight.Ticks())
+        {
+            m_kPage.Raw("<span class=\"y\" style=\"top:").Number(Y(tick), 1).Raw("%\">");
+            m_kPage.Number(tick, m_kHeight.Decimals()).Raw("</span>");
+        }
+    }
+    // The axis goes on to a round number; the motion need not.
+    void LabelFrames()
+    {
+        for (const double tick : CAxis(0.0, m_fLastFrame, kFrameSteps).Ticks())
+        {
+            if (tick > m_fLastFrame || tick != std::floor(tick))
+                continue;
+            m_kPage.Raw("<span class=\"x\" style=\"left:").Number(X(tick) / kWidth * 100.0, 1).Raw("%\">");
+            m_kPage.Number(tick, 0).Raw("</span>");
+        }
+    }
+    void LabelMarks()
+    {
+        for (const ChartMark& mark : m_kChart.marks)
+        {
+            m_kPage.Raw("<span class=\"number\" style=\"left:").Number(X(mark.frame) / kWidth * 100.0, 1);
+            m_kPage.Raw("%\">").Integer(static_cast<long long>(mark.number)).Raw("</span>");
+        }
+    }
+
+    CMarkup& m_kPage;
+    const Chart& m_kChart;
+    std::vector<ThinnedCurve> m_kCurves;
+    CAxis m_kHeight;
+    double m_fLastFrame;
+};
+
+} // namespace
+
+void AppendChart(CMarkup& page, const Chart& chart, size_t mostPoints)
+{
+    const size_t frameCount = FrameCount(chart);
+    if (frameCount == 0)
+        return;
+    std::vector<ThinnedCurve> curves;
+    for (const ChartCurve& curve : chart.curves)
+        curves.push_back({curve, ThinCurve(curve.values, mostPoints)});
+    CChartDrawing(page, chart, std::move(curves), frameCount).Draw();
+}
+
+} // namespace gw
