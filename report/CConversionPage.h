@@ -25,6 +25,9 @@ public:
     /// Takes in a source of which there is nothing to show; `outcome` is said in the table.
     void AddWithoutFigures(const std::string& source, const std::string& outcome);
 
+    /// Whether any conversion was taken in with its figures.
+    bool HasConversions() const { return m_uiSections > 0; }
+
     /// Writes the page in one step; false leaves what is there as it was.
     bool Write(const std::string& path);
 

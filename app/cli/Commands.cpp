@@ -14,8 +14,8 @@ constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_
     return {name, operands, options, required, run, help, example, choice};
 }
 
-constexpr uint32_t kConvertOptions =
-    kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting | kDryRun | kKeepGoing;
+constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting |
+                                     kDryRun | kKeepGoing | kCheck | kHtml;
 
 constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
 

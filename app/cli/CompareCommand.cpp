@@ -1,4 +1,5 @@
 #include "BonePairs.h"
+#include "CConversionPage.h"
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CKeyframeControl.h"
@@ -7,8 +8,9 @@
 #include "CShellWindow.h"
 #include "Commands.h"
 #include "CompareReport.h"
-#include "MeasureConversion.h"
+#include "ConvertedMotion.h"
 #include "PackagedMotion.h"
+#include "PageOutput.h"
 #include "Paths.h"
 #include "Text.h"
 #include "Words.h"
@@ -72,10 +74,27 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
     return misfits.empty();
 }
 
+bool WriteComparison(const COptions& options, const MotionClip& source, const MotionClip& result,
+                     const MeasuredConversion& measured)
+{
+    ConvertedMotion motion;
+    motion.source = options.files[0];
+    motion.result = options.files[1];
+    motion.profile = options.profile;
+    motion.sourceClip = source;
+    motion.resultClip = result;
+    motion.measured = &measured;
+    CConversionPage page(1);
+    page.Add(motion);
+    return WritePage(options, page);
+}
+
 } // namespace
 
 EExit RunCompare(const COptions& options)
 {
+    if (const EExit page = CheckPagePath(options); page != EExit::Done)
+        return page;
     CSceneFile source;
     CMotionFile result;
     const std::string profilePath = FindProfile(options);
@@ -87,17 +106,19 @@ EExit RunCompare(const COptions& options)
     std::vector<BonePair> pairs;
     if (!Pair(profilePath, sourceClip.root, resultClip.root, pairs))
         return EExit::Failed;
-    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, pairs);
-    if (measures.frameCount == 0)
+    MeasuredConversion measured;
+    measured.sums = MeasureConversion(sourceClip, resultClip, pairs, &measured.detail);
+    if (measured.sums.frameCount == 0)
     {
         SayError("there is nothing to compare: a motion has no frames");
         return EExit::Failed;
     }
     if (options.json)
-        WriteMeasures(measures);
+        WriteMeasures(measured.sums);
     else
-        PrintMeasures(measures);
-    return EExit::Done;
+        PrintMeasures(measured.sums);
+    const bool isWritten = options.html.empty() || WriteComparison(options, sourceClip, resultClip, measured);
+    return isWritten ? EExit::Done : EExit::Failed;
 }
 
 } // namespace gw

@@ -123,12 +123,13 @@ void WriteFigures(CJsonWriter& json, const Record& record, const FigureRow<Recor
 
 template <class Record, size_t count>
 void WriteList(CJsonWriter& json, const char* name, const std::vector<Record>& records,
-               const FigureRow<Record> (&rows)[count])
+               const FigureRow<Record> (&rows)[count], ERecordLayout layout)
 {
     json.Key(name).BeginArray();
     for (const Record& record : records)
     {
-        json.BreakLine();
+        if (layout == ERecordLayout::Lines)
+            json.BreakLine();
         json.BeginObject();
         WriteFigures(json, record, rows);
         json.EndObject();
@@ -157,14 +158,14 @@ void PrintBones(const ConversionMeasures& measures)
     }
 }
 
-void PrintFeet(const ConversionMeasures& measures)
+void PrintFeet(const ConversionMeasures& measures, const char* indent)
 {
     for (const FootMeasures& foot : measures.feet)
     {
         std::printf(
-            "%s: contacts %zu of %zu, F1 %s; slide added %.2f mm mean, %.2f mm most; turn %.2f deg mean; "
+            "%s%s: contacts %zu of %zu, F1 %s; slide added %.2f mm mean, %.2f mm most; turn %.2f deg mean; "
             "sole %.2f deg mean; knee pops %zu\n",
-            Printable(foot.target).c_str(), foot.resultContacts, foot.sourceContacts,
+            indent, Printable(foot.target).c_str(), foot.resultContacts, foot.sourceContacts,
             Optional(foot.contactF1).c_str(), foot.addedSlideMean, foot.addedSlideLargest, foot.turnError,
             foot.soleTiltMean, foot.kneePops);
     }
@@ -172,27 +173,37 @@ void PrintFeet(const ConversionMeasures& measures)
 
 } // namespace
 
-void PrintMeasures(const ConversionMeasures& measures)
+void PrintSums(const ConversionMeasures& measures, const char* indent)
 {
-    PrintBones(measures);
-    std::printf("directions: %.3f deg mean, %.3f deg most, over %d frames\n", measures.meanError,
+    std::printf("%sdirections: %.3f deg mean, %.3f deg most, over %d frames\n", indent, measures.meanError,
                 measures.largestError, measures.frameCount);
-    PrintFeet(measures);
-    std::printf("contacts F1 %s; floor %s mm; sinks %.2f mm; travel ratio %s; jitter ratio %s\n",
+    PrintFeet(measures, indent);
+    std::printf("%scontacts F1 %s; floor %s mm; sinks %.2f mm; travel ratio %s; jitter ratio %s\n", indent,
                 Optional(measures.contactF1).c_str(), Optional(measures.floorHeight).c_str(),
                 measures.sinkDepth, Optional(measures.travelRatio).c_str(),
                 Optional(measures.jitterRatio).c_str());
+}
+
+void PrintMeasures(const ConversionMeasures& measures)
+{
+    PrintBones(measures);
+    PrintSums(measures, "");
 }
 
 void WriteMeasures(const ConversionMeasures& measures)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
-    WriteFigures(json, measures, kFigures);
-    WriteList(json, "bones", measures.bones, kBoneFigures);
-    WriteList(json, "feet", measures.feet, kFootFigures);
+    WriteMeasures(json, measures, ERecordLayout::Lines);
     json.EndObject();
     json.EndDocument();
+}
+
+void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecordLayout layout)
+{
+    WriteFigures(json, measures, kFigures);
+    WriteList(json, "bones", measures.bones, kBoneFigures, layout);
+    WriteList(json, "feet", measures.feet, kFootFigures, layout);
 }
 
 } // namespace gw

@@ -1,13 +1,16 @@
+#include "CConversionPage.h"
 #include "CJsonWriter.h"
 #include "Commands.h"
 #include "ConvertFile.h"
 #include "Output.h"
+#include "PageOutput.h"
 #include "Paths.h"
 #include "Text.h"
 #include "Words.h"
 
 #include <array>
 #include <cstdio>
+#include <optional>
 #include <unordered_set>
 
 namespace gw {
@@ -132,11 +135,30 @@ EExit RunJobs(const COptions& options, const Jobs& jobs)
 {
     Tally tally{};
     size_t done = 0;
+    std::optional<CConversionPage> page;
+    if (!options.html.empty() && !options.dryRun)
+        page.emplace(jobs.size());
     for (; done < jobs.size() && (options.keepGoing || Count(tally, EConversion::Failed) == 0); ++done)
-        ++tally[static_cast<size_t>(ConvertFile(options, jobs[done]))];
+        ++tally[static_cast<size_t>(ConvertFile(options, jobs[done], page ? &*page : nullptr))];
     if (!options.outputFolder.empty())
         TellTally(options, tally, jobs.size() - done);
-    return Count(tally, EConversion::Failed) == 0 ? EExit::Done : EExit::Failed;
+    for (size_t left = done; page && left < jobs.size(); ++left)
+        page->AddWithoutFigures(jobs[left].source, "left");
+    const bool isWritten = !page || !page->HasConversions() || WritePage(options, *page);
+    return Count(tally, EConversion::Failed) == 0 && isWritten ? EExit::Done : EExit::Failed;
+}
+
+// The folder of the results is made where it is missing; a page may lie in it.
+bool PrepareFolders(const COptions& options)
+{
+    if (options.dryRun)
+        return true;
+    if (!options.outputFolder.empty() && !CreateFolder(options.outputFolder))
+    {
+        SayError(Printable(options.outputFolder) + ": the folder cannot be made");
+        return false;
+    }
+    return HasPageFolder(options);
 }
 
 } // namespace
@@ -146,17 +168,14 @@ EExit RunConvert(const COptions& options)
     Jobs jobs;
     if (!Plan(options, jobs))
         return EExit::Usage;
+    if (const EExit page = CheckPagePath(options); page != EExit::Done)
+        return page;
     if (jobs.empty())
     {
         SayError("there is no .bvh and no .orn to convert");
         return EExit::Failed;
     }
-    if (!options.outputFolder.empty() && !options.dryRun && !CreateFolder(options.outputFolder))
-    {
-        SayError(Printable(options.outputFolder) + ": the folder cannot be made");
-        return EExit::Failed;
-    }
-    return RunJobs(options, jobs);
+    return PrepareFolders(options) ? RunJobs(options, jobs) : EExit::Failed;
 }
 
 } // namespace gw

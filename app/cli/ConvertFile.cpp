@@ -1,6 +1,7 @@
 #include "ConvertFile.h"
 
 #include "CBoneMapProfile.h"
+#include "CConversionPage.h"
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CShellContent.h"
@@ -37,8 +38,9 @@ struct Account
 class CConversion
 {
 public:
-    CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
-        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account),
+    CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
+                CConversionPage* page)
+        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account), m_pkPage(page),
           m_kPlatform(EPlatformWriting::No, options.dataFolder), m_kContent(window, m_kPlatform)
     {
         window.SetPaths(job.source, job.output);
@@ -50,7 +52,11 @@ public:
             return EConversion::Failed;
         if (m_kOptions.dryRun)
             return EConversion::Planned;
-        return Convert() && Save() ? EConversion::Converted : EConversion::Failed;
+        if (!Convert() || !Save())
+            return EConversion::Failed;
+        if (m_kOptions.check || m_pkPage)
+            Check();
+        return EConversion::Converted;
     }
 
 private:
@@ -59,6 +65,7 @@ private:
     bool MayConvert();
     bool Convert();
     bool Save() { return m_kContent.SaveResult() != 0 && !m_kWindow.HasFailed(); }
+    void Check();
     void KeepMisfit();
     bool RefuseEmpty();
 
@@ -66,6 +73,7 @@ private:
     const CConversionJob& m_kJob;
     CShellWindow& m_kWindow;
     Account& m_kAccount;
+    CConversionPage* m_pkPage; // null where none is asked for
     CFilePlatform m_kPlatform;
     CShellContent m_kContent;
 };
@@ -111,6 +119,21 @@ bool CConversion::Convert()
     return m_kAccount.frames > 0 || RefuseEmpty(); // a container may say that it ends before it begins
 }
 
+// The result is saved: a measuring poses both trees.
+void CConversion::Check()
+{
+    ConvertedMotion motion = MotionOf(m_kContent, m_kJob);
+    m_kAccount.check = MeasureMotion(motion, m_kAccount.profilePath);
+    if (!m_kAccount.check)
+        return;
+    m_kAccount.plainCheck = MeasurePlainRules(m_kOptions, m_kJob, m_kAccount.profilePath);
+    motion.profile = m_kAccount.profile;
+    motion.measured = &*m_kAccount.check;
+    motion.plain = m_kAccount.plainCheck ? &*m_kAccount.plainCheck : nullptr;
+    if (m_pkPage)
+        m_pkPage->Add(motion);
+}
+
 void CConversion::KeepMisfit()
 {
     CProfileFit fit;
@@ -118,13 +141,14 @@ void CConversion::KeepMisfit()
         m_kAccount.misfit = fit;
 }
 
-EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account)
+EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
+                   CConversionPage* page)
 {
     if (options.skipExisting && IsTaken(job.output))
         return EConversion::Skipped;
     const std::optional<CReport> refusal = WhyNotWrite(options, job.output);
     if (!refusal)
-        return CConversion(options, job, window, account).Run();
+        return CConversion(options, job, window, account, page).Run();
     window.Report(*refusal);
     return EConversion::Failed;
 }
@@ -148,7 +172,8 @@ void Print(const CConversionJob& job, const Account& account)
                     ProfileWords(account).c_str());
 }
 
-void WriteJson(const CConversionJob& job, const Account& account, const CShellWindow& window)
+void WriteJson(const COptions& options, const CConversionJob& job, const Account& account,
+               const CShellWindow& window)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -167,21 +192,33 @@ void WriteJson(const CConversionJob& job, const Account& account, const CShellWi
         WriteFit(json, *account.misfit);
         json.EndObject();
     }
+    if (options.check)
+        WriteChecks(json, account);
     json.EndObject();
     json.EndDocument();
 }
 
+std::string OutcomeWords(EConversion outcome)
+{
+    return outcome == EConversion::Converted ? "converted, and could not be measured"
+                                             : kOutcomeNames[static_cast<size_t>(outcome)];
+}
+
 } // namespace
 
-EConversion ConvertFile(const COptions& options, const CConversionJob& job)
+EConversion ConvertFile(const COptions& options, const CConversionJob& job, CConversionPage* page)
 {
     CShellWindow window(options);
     Account account;
-    account.outcome = Decide(options, job, window, account);
+    account.outcome = Decide(options, job, window, account, page);
+    if (page && !account.check)
+        page->AddWithoutFigures(job.source, OutcomeWords(account.outcome));
     if (options.json)
-        WriteJson(job, account, window);
+        WriteJson(options, job, account, window);
     else if (!options.quiet)
         Print(job, account);
+    if (options.check && !options.json && !options.quiet)
+        PrintChecks(account);
     return account.outcome;
 }
 

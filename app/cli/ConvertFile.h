@@ -8,6 +8,8 @@
 
 namespace gw {
 
+class CConversionPage;
+
 /// One source and the file that becomes of it.
 struct CConversionJob
 {
@@ -25,7 +27,7 @@ enum class EConversion : uint8_t
 
 /// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Tells the result
 /// on standard output and everything else on standard error. Each has a state machine of its own, so that
-/// nothing of one source stays for the next.
-EConversion ConvertFile(const COptions& options, const CConversionJob& job);
+/// nothing of one source stays for the next. `page`, where there is one, takes the conversion in.
+EConversion ConvertFile(const COptions& options, const CConversionJob& job, CConversionPage* page);
 
 } // namespace gw

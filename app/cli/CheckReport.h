@@ -1,0 +1,16 @@
+#pragma once
+
+#include <string_view>
+
+namespace gw {
+
+class CJsonWriter;
+struct MeasuredConversion;
+
+/// What was measured of a conversion, as a compact block of lines that stands under it on standard output.
+void PrintCheck(const MeasuredConversion& measured, std::string_view title);
+/// The same as members of a JSON object that is open: all that a comparison has, the parts of the body and
+/// the worst frames.
+void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured);
+
+} // namespace gw

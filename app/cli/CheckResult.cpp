@@ -1,0 +1,74 @@
+#include "CheckResult.h"
+
+#include "CFilePlatform.h"
+#include "CKeyframeControl.h"
+#include "CReport.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "ConvertFile.h"
+#include "SourceTiming.h"
+
+namespace gw {
+
+namespace {
+
+// What goes wrong beside a conversion that went well is nothing to tell.
+class CSilentWindow : public CShellWindow
+{
+public:
+    using CShellWindow::CShellWindow;
+
+    EAnswer ShowMessageBox(int, const std::string&, EButtons buttons) override
+    {
+        return buttons == EButtons::OK ? EAnswer::OK : EAnswer::No;
+    }
+    void Report(const CReport&) override {}
+};
+
+// A source moves by the track by which it was converted.
+MotionClip SourceClip(const CShellContent& content)
+{
+    const CKeyframeControl* track = ConversionTrack(content.SourceRoot());
+    if (!track)
+        return {};
+    return {content.SourceRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
+}
+
+} // namespace
+
+ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job)
+{
+    ConvertedMotion motion;
+    motion.source = job.source;
+    motion.result = job.output;
+    motion.sourceClip = SourceClip(content);
+    motion.resultClip = ClipOf(content.ResultMotion());
+    return motion;
+}
+
+std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, const std::string& profilePath)
+{
+    std::vector<BonePair> pairs;
+    std::vector<PairMisfit> misfits;
+    if (!ReadBonePairs(profilePath, motion.sourceClip.root, motion.resultClip.root, pairs, misfits))
+        return std::nullopt;
+    MeasuredConversion measured;
+    measured.sums = MeasureConversion(motion.sourceClip, motion.resultClip, pairs, &measured.detail);
+    return measured.sums.frameCount > 0 ? std::optional(std::move(measured)) : std::nullopt;
+}
+
+std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, const CConversionJob& job,
+                                                    const std::string& profilePath)
+{
+    if (!options.align && !options.faithful)
+        return std::nullopt;
+    CSilentWindow window(options);
+    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
+    window.SetPaths(job.source, job.output);
+    CShellContent content(window, platform);
+    if (content.OpenSource() == 0 || !content.SelectProfile(profilePath) || content.ConvertMotion() == 0)
+        return std::nullopt;
+    return MeasureMotion(MotionOf(content, job), profilePath);
+}
+
+} // namespace gw

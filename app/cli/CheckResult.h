@@ -1,0 +1,27 @@
+#pragma once
+
+#include "ConvertedMotion.h"
+
+#include <optional>
+
+namespace gw {
+
+class CShellContent;
+struct CConversionJob;
+struct COptions;
+
+/// The open source and the result of a content that has converted, as clips of trees that live with it; named
+/// after the job.
+ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job);
+
+/// Measures these by the profile file that made the one of the other. Nothing where it cannot be read any
+/// more or there are no frames.
+std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,
+                                                const std::string& profilePath);
+
+/// Converts the job's source once more by the plain rules, without a word, and measures what comes of it.
+/// Nothing where that fails, and where the options ask for the plain rules as it is.
+std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, const CConversionJob& job,
+                                                    const std::string& profilePath);
+
+} // namespace gw

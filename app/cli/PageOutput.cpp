@@ -1,0 +1,46 @@
+#include "PageOutput.h"
+
+#include "CConversionPage.h"
+#include "Output.h"
+#include "Paths.h"
+#include "Text.h"
+#include "Words.h"
+
+namespace gw {
+
+EExit CheckPagePath(const COptions& options)
+{
+    const std::string& path = options.html;
+    if (path.empty())
+        return EExit::Done;
+    if (!HasExtension(path, ".html") && !HasExtension(path, ".htm"))
+    {
+        SayError(Printable(path) + ": a page is an .html file");
+        return EExit::Usage;
+    }
+    return MayWrite(options, path) ? EExit::Done : EExit::Failed;
+}
+
+bool HasPageFolder(const COptions& options)
+{
+    const std::string folder = SplitPath(options.html).folder;
+    if (folder.empty() || FolderExists(folder))
+        return true;
+    SayError(Printable(options.html) + ": there is no such folder");
+    return false;
+}
+
+bool WritePage(const COptions& options, CConversionPage& page)
+{
+    if (!page.Write(options.html))
+    {
+        SayError(Printable(options.html) +
+                 ": the page cannot be written (check the path, the permissions and " +
+                 "the room on the disk)");
+        return false;
+    }
+    SayWord(options, "the page is " + Printable(options.html));
+    return true;
+}
+
+} // namespace gw

@@ -1,0 +1,19 @@
+#pragma once
+
+#include "COptions.h"
+
+namespace gw {
+
+class CConversionPage;
+
+/// Whether --html names a page that may be written; Done without one. Says what is wrong: a page ends in
+/// .html or .htm, so that a slip replaces no motion, and one that exists wants --force.
+EExit CheckPagePath(const COptions& options);
+
+/// Whether the folder of the page is there, so that nobody learns behind a long run that it is not. Says so.
+bool HasPageFolder(const COptions& options);
+
+/// Writes the page in one step. Says where it is, or that it cannot be written.
+bool WritePage(const COptions& options, CConversionPage& page);
+
+} // namespace gw
