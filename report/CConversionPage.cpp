@@ -3,6 +3,7 @@
 #include "CConversionSection.h"
 #include "CSafeFile.h"
 #include "PageStyle.h"
+#include "Paths.h"
 
 #include <algorithm>
 #include <limits>
@@ -61,7 +62,7 @@ std::string CConversionPage::Head() const
              "<meta name=\"viewport\" content=\"width=device-width, initial-scale=1\"/>\n"
              "<meta name=\"color-scheme\" content=\"light dark\"/>\n<title>");
     if (m_kRows.size() == 1)
-        page.Name(m_kRows[0].source);
+        page.Name(SplitPath(m_kRows[0].source).stem);
     else
         page.Integer(static_cast<long long>(m_kRows.size())).Raw(" motions");
     page.Raw(": conversion report</title>\n<style>\n").Raw(kPageStyle).Raw("</style>\n</head>\n<body>\n");
@@ -78,11 +79,12 @@ void CConversionPage::AppendSummaryRow(CMarkup& page, const Row& row)
     page.Raw("<tr><td class=\"word\">");
     if (!row.outcome.empty())
     {
-        page.Name(row.source).Raw("</td><td class=\"word none\" colspan=\"0\">").Name(row.outcome);
-        page.Raw("</td></tr>\n");
+        page.FileName(row.source).Raw("</td><td class=\"word none\" colspan=\"");
+        page.Integer(static_cast<long long>(KeyFigureCount() + 1)).Raw("\">");
+        page.Name(row.outcome).Raw("</td></tr>\n");
         return;
     }
-    page.Raw("<a href=\"#").Raw(Anchor(row.section)).Raw("\">").Name(row.source).Raw("</a></td><td>");
+    page.Raw("<a href=\"#").Raw(Anchor(row.section)).Raw("\">").FileName(row.source).Raw("</a></td><td>");
     page.Integer(row.frameCount).Raw("</td>");
     for (const KeyFigure& figure : row.figures)
     {

@@ -88,8 +88,10 @@ void CConversionSection::Append(CMarkup& page, const std::string& anchor)
 void CConversionSection::AppendHead(CMarkup& page) const
 {
     const ConversionMeasures& sums = m_kMotion.measured->sums;
-    page.Raw("<h2><span class=\"source\">").Name(m_kMotion.source).Raw("</span> → <span class=\"result\">");
-    page.Name(m_kMotion.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(m_kMotion.profile);
+    page.Raw("<h2><span class=\"source\">")
+        .FileName(m_kMotion.source)
+        .Raw("</span> → <span class=\"result\">");
+    page.FileName(m_kMotion.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(m_kMotion.profile);
     page.Raw(" · ").Integer(sums.frameCount).Raw(" frames compared · ");
     page.Number(sums.frameCount * m_kMotion.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
 }

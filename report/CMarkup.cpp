@@ -1,6 +1,7 @@
 #include "CMarkup.h"
 
 #include "Numbers.h"
+#include "Paths.h"
 #include "Text.h"
 
 #include <cstddef>
@@ -44,6 +45,12 @@ CMarkup& CMarkup::Name(std::string_view name)
             m_kText += escape;
     }
     return name.size() > kLongestName ? Raw("…") : *this;
+}
+
+CMarkup& CMarkup::FileName(std::string_view path)
+{
+    const CPathParts parts = SplitPath(path);
+    return Raw("<span title=\"").Name(path).Raw("\">").Name(parts.stem + parts.extension).Raw("</span>");
 }
 
 CMarkup& CMarkup::Number(double value, int decimals)

@@ -17,6 +17,8 @@ public:
     /// A name from a file as text or between the quotes of an attribute: nothing in it can be markup, control
     /// characters and bytes that are no UTF-8 stand as \xNN, and a very long one is cut.
     CMarkup& Name(std::string_view name);
+    /// The name of the file that a path leads to, with the whole path behind it for whoever points there.
+    CMarkup& FileName(std::string_view path);
     CMarkup& Number(double value, int decimals);
     CMarkup& Integer(long long value);
 

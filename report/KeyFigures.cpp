@@ -8,6 +8,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <iterator>
 
 namespace gw {
 
@@ -134,7 +135,7 @@ std::string Shortest(double value)
 
 std::string MarkOf(const Row& row)
 {
-    constexpr const char* kBefore[] = {"up to ", "from ", "within ", "within "};
+    constexpr const char* kBefore[] = {"to ", "from ", "within ", "within "};
     const auto before = kBefore[static_cast<size_t>(row.ideal)];
     const std::string behind = std::string(row.unit) + (row.ideal == EIdeal::One ? " of 1" : "");
     return "good " + (before + Shortest(row.good)) + behind + ", fair " + before + Shortest(row.fair) +
@@ -156,6 +157,11 @@ constexpr VerdictRow kVerdicts[] = {
 };
 
 } // namespace
+
+size_t KeyFigureCount()
+{
+    return std::size(kRows);
+}
 
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail)
 {
@@ -196,7 +202,7 @@ std::string_view VerdictClass(EVerdict verdict)
 void AppendFigure(CMarkup& page, const KeyFigure& figure)
 {
     if (figure.value)
-        page.Number(*figure.value, figure.decimals).Raw(figure.unit);
+        page.Number(*figure.value, figure.decimals).Raw("<i>").Raw(figure.unit).Raw("</i>");
     else
         page.Raw("none");
 }

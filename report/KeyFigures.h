@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstddef>
 #include <cstdint>
 #include <optional>
 #include <string>
@@ -32,6 +33,8 @@ struct KeyFigure
     std::string mark; ///< what is good and what is fair, in words
 };
 
+/// How many there are.
+size_t KeyFigureCount();
 /// All of them, always as many and in the same order.
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail);
 

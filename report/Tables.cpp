@@ -40,12 +40,12 @@ void NumberCell(CMarkup& page, double value, int decimals)
     page.Raw("<td>").Number(value, decimals).Raw("</td>");
 }
 
-// A number with a bar behind it, so that the eye finds the large ones.
+// A number with a bar before it, so that the eye finds the large ones.
 void BarCell(CMarkup& page, double degrees)
 {
     const double share = std::isfinite(degrees) ? std::clamp(degrees / kFullBar, 0.0, 1.0) : 1.0;
-    page.Raw("<td class=\"bar\"><i style=\"width:").Number(share * 100.0, 0).Raw("%\"></i><b>");
-    page.Number(degrees, 3).Raw("</b></td>");
+    page.Raw("<td class=\"bar\"><i style=\"--share:").Number(share, 2).Raw("\"></i>");
+    page.Number(degrees, 3).Raw("</td>");
 }
 
 void FrameCell(CMarkup& page, int frame)
@@ -133,7 +133,7 @@ constexpr FootRow kFootRows[] = {
 
 void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"part"}, {"mean °", "most °", "in", "at frame"}, plain != nullptr);
+    BeginTable(page, {"part"}, {"mean °", "most °", "at frame", "in"}, plain != nullptr);
     for (const PartMeasures& part : measured.detail.parts)
     {
         if (part.boneCount == 0)
@@ -142,8 +142,8 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
         NameCell(page, part.name);
         BarCell(page, part.meanError);
         NumberCell(page, part.largestError, 3);
-        page.Raw("<td>").Name(part.largestBone).Raw("</td>");
         FrameCell(page, part.largestFrame);
+        NameCell(page, part.largestBone);
         if (const PartMeasures* other = PartOf(plain, part.name))
             NumberCell(page, other->meanError, 3);
         page.Raw("</tr>\n");

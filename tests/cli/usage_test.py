@@ -41,6 +41,7 @@ WRONG = [  # what, arguments, words on standard error
     ("a name for several results", "convert a.bvh b.bvh -o c.htr --out-dir d", ["-o"]),
     ("two sources of one stem", "convert x/a.bvh y/a.bvh --out-dir d", ["y/a.bvh", "a.Kinetra"]),
     ("an .htr of what is none", "transcode a.bvh a.htr", ["a.htr", ".bvh"]),
+    ("a page of another kind", "convert a.bvh --html a.bvh", ["a.bvh", ".html"]),
     ("frames of a .bvh scaled", "transcode a.htr a.bvh --frame-scale 2", ["--frame-scale"]),
 ]
 

@@ -1,0 +1,147 @@
+"""Results that are measured as they are made, and pages about them."""
+import json
+import xml.etree.ElementTree as ElementTree
+
+from harness import DONE, FAILED, USAGE, WALK, CliTest, main
+from made import BVH, profile
+
+POSER = ["--profile", "Poser BVH"]
+OLD = "a page of somebody's own"
+
+
+def lines(result):
+    return [json.loads(line) for line in result.out.splitlines()]
+
+
+class ReportTest(CliTest):
+    def page(self, name="page.html"):
+        """The page as a tree: an HTML page that is well-formed XML besides."""
+        text = self.read(name).decode("utf-8")
+        self.assertTrue(text.startswith("<!DOCTYPE html>"))
+        self.assertNotIn("http", text)
+        return ElementTree.fromstring(text)
+
+    def texts(self, page, tag="td"):
+        return ["".join(cell.itertext()).strip() for cell in page.iter(tag)]
+
+
+class Check(ReportTest):
+    def test_a_result_is_measured_as_compare_measures_its_file(self):
+        told = lines(self.succeed("convert", WALK, "-o", "a.htr", *POSER, "--check", "--json"))[0]
+        check = told["check"]
+        compared = json.loads(self.succeed("compare", WALK, "a.htr", *POSER, "--json").out)
+        self.assertEqual([bone["target"] for bone in check["bones"]], [bone["target"] for bone in compared["bones"]])
+        for ours, theirs in zip(check["bones"] + check["feet"] + [check],
+                                compared["bones"] + compared["feet"] + [compared]):
+            for name, figure in theirs.items():
+                if name in ("frameScale", "bones", "feet"):
+                    continue
+                if isinstance(figure, float) and "Frame" not in name:
+                    self.assertAlmostEqual(ours[name], figure, delta=0.02 + abs(figure) * 1e-3, msg=name)
+        self.assertEqual(check["frameCount"], compared["frameCount"])
+        self.assertNotIn("plainCheck", told)
+
+    def test_parts_and_worst_frames_are_named(self):
+        check = lines(self.succeed("convert", WALK, "-o", "a.htr", *POSER, "--check", "--json"))[0]["check"]
+        bones = {bone["target"]: bone["meanError"] for bone in check["bones"] if bone["measured"]}
+        parts = {part["part"]: part["meanError"] for part in check["parts"]}
+        self.assertAlmostEqual(parts["thigh"], (bones["LThigh"] + bones["RThigh"]) / 2, delta=1e-3)
+        for foot in check["feet"]:
+            self.assertEqual(len(check["kneePopFrames"][foot["target"]]), foot["kneePops"])
+        worst = check["worstFrames"]
+        self.assertEqual(len(worst), 3)
+        self.assertEqual(worst[0]["fault"], "direction")
+        self.assertTrue(all(0 <= frame["frame"] < check["frameCount"] for frame in worst))
+
+    def test_the_figures_stand_under_each_result(self):
+        for name in ("a", "b"):
+            self.write("takes/%s.bvh" % name, WALK.read_bytes())
+        plain = self.succeed("convert", "takes", "--out-dir", "plain").out
+        told = self.succeed("convert", "takes", "--out-dir", "out", "--check").out
+        kept = [line for line in told.splitlines() if not line.startswith("  ")]
+        self.assertEqual([line.replace("out/", "plain/") for line in kept], plain.splitlines())
+        for word in ("parts: upper arm ", "contacts F1 ", "worst: frame "):
+            self.assertGreaterEqual(told.count(word), 2, word)
+        self.assertEqual(self.read("out/a.Kinetra"), self.read("plain/a.Kinetra"))
+        self.assertEqual(self.succeed("convert", WALK, "-o", "q.htr", "--check", "--quiet").out, "")
+
+
+class Page(ReportTest):
+    def test_the_page_has_the_figures_of_the_comparison(self):
+        self.succeed("convert", WALK, "-o", "a.Kinetra", *POSER)
+        plain = self.succeed("compare", WALK, "a.Kinetra", *POSER).out
+        compared = self.succeed("compare", WALK, "a.Kinetra", *POSER, "--html", "page.html")
+        self.assertEqual(compared.out, plain)
+        figures = json.loads(self.succeed("compare", WALK, "a.Kinetra", *POSER, "--json").out)
+        cells = self.texts(self.page())
+        for bone in figures["bones"]:
+            if not bone["measured"]:
+                continue
+            row = cells.index(bone["target"], cells.index("LowerTorso"))
+            self.assertEqual(cells[row + 1], bone["source"])
+            self.assertAlmostEqual(float(cells[row + 2]), bone["meanError"], delta=6e-4)
+            self.assertAlmostEqual(float(cells[row + 3]), bone["largestError"], delta=6e-4)
+        pops = cells.index("knee pops")
+        self.assertEqual(cells[pops + 1:pops + 3], [str(foot["kneePops"]) for foot in figures["feet"]])
+
+    def test_several_sources_begin_with_a_table(self):
+        for name in ("a", "c"):
+            self.write("takes/%s.bvh" % name, WALK.read_bytes())
+        self.write("takes/b.bvh", BVH.replace("Frames: 3", "Frames: 30"))
+        result = self.with_assets("convert", "takes", "--out-dir", "out", "--keep-going", "--html", "out/page.html")
+        self.assertEqual(result.code, FAILED)
+        page = self.page("out/page.html")
+        summary = next(table for table in page.iter("table") if table.get("class") == "summary")
+        rows = [self.texts(row) for row in summary.iter("tr")][1:]
+        self.assertEqual([row[0] for row in rows], ["b.bvh", "a.bvh", "c.bvh"])
+        self.assertEqual(rows[0][1], "failed")
+        links = {link.get("href") for link in summary.iter("a")}
+        self.assertEqual(links, {"#" + section.get("id") for section in page.iter("section")})
+
+    def test_names_of_files_and_bones_cannot_be_markup(self):
+        joint = '<b>&"\'\x01\xff'.encode("latin-1")
+        self.write("a&<i>.bvh", BVH.encode().replace(b"Hips", joint).replace(b"Chest", b"</style>"))
+        rows = profile("<u>", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")])
+        rows = rows if isinstance(rows, bytes) else rows.encode()
+        self.write("map.prf", rows.replace(b"Hips", joint).replace(b"Chest", b"</style>"))
+        self.succeed("convert", "a&<i>.bvh", "-o", "a.htr", "--profile", "map.prf", "--html", "page.html")
+        page = self.page()
+        self.assertEqual(list(page.iter("u")), [])
+        self.assertIn('<b>&"\'\\x01\\xff', self.texts(page))
+        self.assertIn("a&<i>.bvh", self.texts(page, "h2")[0])
+
+    def test_a_page_that_cannot_be_is_refused_before_the_work(self):
+        self.write("page.html", OLD)
+        rows = [  # what, page, code, words
+            ("a page that exists", "page.html", FAILED, ["page.html", "--force"]),
+            ("a motion by a slip", "walk.bvh", USAGE, ["walk.bvh", ".html"]),
+            ("a folder that is not there", "none/page.html", FAILED, ["none/page.html", "folder"]),
+        ]
+        for what, name, code, words in rows:
+            with self.subTest(what):
+                before = self.files()
+                result = self.with_assets("convert", WALK, "-o", "a.htr", "--html", name)
+                self.assertEqual((result.code, result.out), (code, ""))
+                self.assert_words(result, words)
+                self.assertEqual(self.files(), before)
+        self.succeed("convert", WALK, "-o", "a.htr", "--html", "page.html", "--force")
+        self.page()
+
+    def test_a_page_is_whole_or_not_there(self):
+        self.write("page.html", OLD)
+        self.succeed("convert", WALK, "-o", "a.htr", *POSER)
+        before = self.files()
+        result = self.with_assets("compare", WALK, "a.htr", *POSER, "--html", "page.html", "--force", file_limit=9000)
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["page.html", "cannot be written"])
+        self.assertEqual((self.files(), self.read("page.html")), (before, OLD.encode()))
+
+    def test_nothing_is_written_for_nothing(self):
+        self.write("broken.bvh", BVH.replace("Frames: 3", "Frames: 30"))
+        self.with_assets("convert", "broken.bvh", "-o", "b.htr", "--html", "page.html")
+        self.assertEqual(self.with_assets("convert", WALK, "--dry-run", "--check", "--html", "page.html").code, DONE)
+        self.assertEqual(self.files(), ["broken.bvh"])
+
+
+if __name__ == "__main__":
+    main()

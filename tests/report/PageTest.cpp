@@ -1,0 +1,234 @@
+// What stands in a page, whatever the names and the numbers of a motion.
+
+#include "CConversionPage.h"
+#include "CMadeFigure.h"
+#include "CMarkup.h"
+#include "ConvertedMotion.h"
+#include "TempFolder.h"
+
+#include <gtest/gtest.h>
+#include <limits>
+#include <regex>
+
+namespace gw {
+
+namespace {
+
+constexpr int kFrames = 40;
+
+const auto kStill = [](CMadeFigure&, int) {};
+
+// Two figures, what was measured of them, and the page about them.
+class CMadeConversion
+{
+public:
+    template <class Pose>
+    explicit CMadeConversion(const Pose& pose, int frameCount = kFrames)
+    {
+        m_kMotion.source = "takes/made.bvh";
+        m_kMotion.result = "made.Kinetra";
+        m_kMotion.profile = "Made";
+        m_kMotion.sourceClip = m_kSource.Record(frameCount, kStill);
+        m_kMotion.resultClip = m_kResult.Record(frameCount, pose);
+        m_kMotion.measured = &m_kMeasured;
+        Measure();
+    }
+    // Again, behind a change of names or keys.
+    void Measure()
+    {
+        m_kMeasured.sums = MeasureConversion(m_kMotion.sourceClip, m_kMotion.resultClip,
+                                             PairByName(m_kSource, m_kResult), &m_kMeasured.detail);
+    }
+    ConvertedMotion& Motion() { return m_kMotion; }
+    MeasuredConversion& Measured() { return m_kMeasured; }
+    CMadeFigure& Source() { return m_kSource; }
+
+    std::string Page() const
+    {
+        CConversionPage page(1);
+        page.Add(m_kMotion);
+        return Written(page);
+    }
+    static std::string Written(CConversionPage& page)
+    {
+        const CTempFolder folder;
+        EXPECT_TRUE(page.Write(folder.Path("page.html")));
+        return ReadBytes(folder.Path("page.html"));
+    }
+
+private:
+    CMadeFigure m_kSource;
+    CMadeFigure m_kResult;
+    ConvertedMotion m_kMotion;
+    MeasuredConversion m_kMeasured;
+};
+
+size_t Count(const std::string& text, std::string_view word)
+{
+    size_t count = 0;
+    for (size_t at = text.find(word); at != text.npos; at = text.find(word, at + 1))
+        ++count;
+    return count;
+}
+
+bool Has(const std::string& text, std::string_view word)
+{
+    return text.find(word) != text.npos;
+}
+
+// Every element is closed in the order in which they were opened.
+void ExpectBalanced(const std::string& page)
+{
+    static const std::regex kTag("<(/?)([a-z][a-z0-9]*)[^>]*?(/?)>");
+    std::vector<std::string> open;
+    for (std::sregex_iterator tag(page.begin(), page.end(), kTag), end; tag != end; ++tag)
+    {
+        if ((*tag)[3].length() > 0)
+            continue;
+        if ((*tag)[1].length() == 0)
+        {
+            open.push_back((*tag)[2]);
+            continue;
+        }
+        ASSERT_FALSE(open.empty()) << tag->str();
+        EXPECT_EQ(open.back(), (*tag)[2].str());
+        open.pop_back();
+    }
+    EXPECT_TRUE(open.empty());
+}
+
+const auto kFaulty = [](CMadeFigure& figure, int frame) {
+    figure.Turn("LForearm", kVec3UnitZ, frame == 20 ? 60.0 : 1.0);
+    figure.Turn("LCalf", kVec3UnitX, frame == 35 ? 14.0 : 0.0);
+};
+
+} // namespace
+
+TEST(Page, ShowsTheFramesOfMadeFaultsWithBothSkeletons)
+{
+    const std::string page = CMadeConversion(kFaulty).Page();
+    ExpectBalanced(page);
+    EXPECT_TRUE(Has(page, "<b>Frame 20</b> main bones"));
+    EXPECT_TRUE(Has(page, "most of all LForearm, 60.0°"));
+    EXPECT_TRUE(Has(page, "<b>Frame 35</b> the knee above LFoot jumps by 14.0°"));
+    const size_t frames = Count(page, "<article>");
+    EXPECT_EQ(frames, 3u);
+    EXPECT_EQ(Count(page, "aria-label=\"source, from"), 2 * frames);
+    EXPECT_EQ(Count(page, "aria-label=\"result, from"), 2 * frames);
+    EXPECT_EQ(Count(page, "<circle"), 4 * frames);
+}
+
+TEST(Page, NeedsNothingFromAnywhere)
+{
+    const std::string page = CMadeConversion(kFaulty).Page();
+    for (const char* word : {"http", "<script", "<link", "@import", "url(", "src="})
+        EXPECT_FALSE(Has(page, word)) << word;
+    EXPECT_TRUE(Has(page, "prefers-color-scheme: dark"));
+}
+
+TEST(Page, HostileNamesAreTextAndNothingElse)
+{
+    const char* const hostile = "<b>\"'&\x1b\xff\xc2\x85</style>";
+    CMadeConversion made(kFaulty);
+    made.Motion().source = made.Motion().result = made.Motion().profile = hostile;
+    made.Source().Bone("LForearm").SetName(hostile);
+    for (BoneMeasures& bone : made.Measured().sums.bones)
+        bone.source = bone.target = hostile;
+    for (FootMeasures& foot : made.Measured().sums.feet)
+        foot.source = foot.target = hostile;
+    const std::string page = made.Page();
+    ExpectBalanced(page);
+    EXPECT_EQ(Count(page, "</style>"), 1u);
+    EXPECT_TRUE(Has(page, "&lt;b&gt;&quot;&#39;&amp;\\x1b\\xff\\xc2\\x85&lt;/style&gt;"));
+    EXPECT_FALSE(Has(page, "\x1b") || Has(page, "\xff"));
+    EXPECT_EQ(CMarkup().Name(std::string(100000, 'x')).Text().size(), 300 + std::string_view("…").size());
+}
+
+TEST(Page, SaysHowAFigureStandsInWords)
+{
+    const auto poor = [](CMadeFigure& figure, int) { figure.Turn("LowerTorso", kVec3UnitX, 40.0); };
+    EXPECT_TRUE(Has(CMadeConversion(poor).Page(), "✕ Poor"));
+    const std::string same = CMadeConversion(kStill).Page();
+    EXPECT_TRUE(Has(same, "✓ Good"));
+    EXPECT_TRUE(Has(same, "– None")) << "a motion that stands still has no jitter to compare";
+    EXPECT_FALSE(Has(same, "Poor"));
+    EXPECT_FALSE(Has(same, "Worst frames"));
+}
+
+TEST(Page, LongMotionsStaySmall)
+{
+    CMadeConversion made(kFaulty, 2);
+    ConversionDetail& detail = made.Measured().detail;
+    for (std::vector<float>* curve : {&detail.meanError, &detail.largestError, &detail.feet[0].sourceKnee,
+                                      &detail.feet[0].resultSole, &detail.feet[1].sourceSole})
+    {
+        curve->resize(100000);
+        for (size_t f = 0; f < curve->size(); ++f)
+            (*curve)[f] = static_cast<float>(f * 7919 % 997);
+    }
+    detail.largestBone.resize(100000);
+    const std::string page = made.Page();
+    EXPECT_LT(page.size(), 300000u);
+    EXPECT_GT(page.size(), 50000u) << "and they are there";
+}
+
+// What a damaged motion may bring: the page is made, and whole.
+TEST(Page, NumbersThatAreNoneDoNoHarm)
+{
+    for (const float odd : {std::numeric_limits<float>::quiet_NaN(), std::numeric_limits<float>::infinity(),
+                            std::numeric_limits<float>::max()})
+    {
+        const auto lost = [=](CMadeFigure& figure, int frame) {
+            figure.Turn("LForearm", kVec3UnitZ, 20.0);
+            if (frame == 7)
+                figure.Move("LCalf", {odd, 0.0f, odd});
+        };
+        ExpectBalanced(CMadeConversion(lost, 12).Page());
+        const auto everywhere = [=](CMadeFigure& figure, int) { figure.Move("LowerTorso", {odd, odd, odd}); };
+        ExpectBalanced(CMadeConversion(everywhere, 3).Page());
+    }
+}
+
+TEST(Page, SeveralMotionsBeginWithATableOfTheWorst)
+{
+    const auto bad = [](CMadeFigure& figure, int) { figure.Turn("LowerTorso", kVec3UnitX, 40.0); };
+    CMadeConversion good(kStill);
+    CMadeConversion poor(bad);
+    good.Motion().source = "good.bvh";
+    poor.Motion().source = "poor.bvh";
+    CConversionPage page(3);
+    page.Add(good.Motion());
+    page.Add(poor.Motion());
+    page.AddWithoutFigures("broken.bvh", "failed");
+    const std::string text = CMadeConversion::Written(page);
+    ExpectBalanced(text);
+    EXPECT_LT(text.find(">broken.bvh<"), text.find(">poor.bvh<"));
+    EXPECT_LT(text.find(">poor.bvh<"), text.find(">good.bvh<"));
+    EXPECT_LT(text.find("href=\"#motion2\""), text.find("href=\"#motion1\""));
+    EXPECT_EQ(Count(text, "<section id=\"motion"), 2u);
+}
+
+// The column of the plain rules stands where there is such a measuring, and not elsewhere.
+TEST(Page, SetsTheChoicesAgainstThePlainRules)
+{
+    CMadeConversion plain([](CMadeFigure& figure, int) { figure.Turn("LForearm", kVec3UnitZ, 33.0); });
+    CMadeConversion chosen(kStill);
+    EXPECT_FALSE(Has(chosen.Page(), "plain rules"));
+    chosen.Motion().plain = &plain.Measured();
+    const std::string page = chosen.Page();
+    EXPECT_TRUE(Has(page, "<th>plain rules</th>"));
+    EXPECT_TRUE(Has(page, "<td>33.000</td>"));
+}
+
+TEST(Page, IsWrittenInFullOrNotAtAll)
+{
+    const CTempFolder folder;
+    CConversionPage page(1);
+    page.Add(CMadeConversion(kStill).Motion());
+    EXPECT_FALSE(page.Write(folder.Path("gone/page.html")));
+    EXPECT_FALSE(page.Write(folder.Path()));
+    EXPECT_TRUE(page.Write(folder.Path("page.html")));
+    EXPECT_TRUE(ReadBytes(folder.Path("page.html")).ends_with("</html>\n"));
+}
+
+} // namespace gw
