@@ -96,6 +96,18 @@ std::vector<float> Curve(const CLegTrack& leg, float CLegTrack::Posture::*number
     return curve;
 }
 
+// Below this share of a leg an ankle stands on its floor as none does: the skeleton has no sole.
+constexpr double kNoSole = 0.01;
+
+// How far the floor lies under the soles of the source, where these are its ankles: as far in leg lengths as
+// under those of the result.
+double DepthUnderSoles(const CFeetTrack& source, const CFeetTrack& result)
+{
+    if (source.Legs()[0].AnkleHeight() > kNoSole * source.LegLength())
+        return 0.0;
+    return result.Legs()[0].AnkleHeight() / result.LegLength() * source.LegLength();
+}
+
 // The height on which the soles of a skeleton stand.
 double SoleFloor(const std::vector<CLegTrack>& legs)
 {
@@ -181,12 +193,13 @@ void CFeetMeter::WriteDetail(ConversionDetail& detail, const LegContacts& source
                              const LegContacts& result) const
 {
     const double scale = ResultLeg() / SourceLeg();
-    detail.sourceFloor = SoleFloor(m_kSource.Legs());
+    const double soleFloor = SoleFloor(m_kSource.Legs());
+    detail.sourceFloor = soleFloor - DepthUnderSoles(m_kSource, m_kResult);
     for (size_t i = 0; i < m_kPairs.size(); ++i)
     {
         const CLegTrack& from = m_kSource.Legs()[i];
         const CLegTrack& to = m_kResult.Legs()[i];
-        detail.feet.push_back({Curve(from, &CLegTrack::Posture::soleHeight, detail.sourceFloor, scale),
+        detail.feet.push_back({Curve(from, &CLegTrack::Posture::soleHeight, soleFloor, scale),
                                Curve(to, &CLegTrack::Posture::soleHeight),
                                Curve(from, &CLegTrack::Posture::kneeAngle),
                                Curve(to, &CLegTrack::Posture::kneeAngle), source[i], result[i]});

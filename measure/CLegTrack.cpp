@@ -58,6 +58,11 @@ double CLegTrack::Length() const
     return Vec3Length(knee - PlaceOf(*m_kJoints.thigh)) + Vec3Length(PlaceOf(*m_kJoints.ankle) - knee);
 }
 
+double CLegTrack::AnkleHeight() const
+{
+    return Vec3Length(m_kHeelSole);
+}
+
 Vec3 CLegTrack::Heading() const
 {
     if (HasToe())

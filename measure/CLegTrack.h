@@ -38,6 +38,8 @@ public:
     bool HasToe() const { return m_kJoints.toe != nullptr; }
     /// Thigh to knee to ankle, as posed.
     double Length() const;
+    /// The ankle above the sole in the rest pose; 0 for a skeleton that ends at its ankles.
+    double AnkleHeight() const;
     /// Where the foot points, as posed.
     Vec3 Heading() const;
     /// Lets a foot without a toe joint point from now on as it would have to be pointing now.

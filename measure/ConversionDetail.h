@@ -13,7 +13,7 @@ namespace gw {
 // What a conversion did frame by frame, beside the sums of ConversionMeasures: kept only when asked for. All
 // curves have one number for each frame compared, 32 bits each: about a hundred bytes a frame. Angles are
 // degrees. Lengths are in the result's unit (mm) on both sides: the source's are scaled by the ratio of the
-// legs. Heights are those above the floor: y = 0 for the result, the floor of its own soles for the source.
+// legs. Heights are those above the floor: y = 0 for the result, for the source where its own soles stand.
 
 /// How the bones of one part of the body point.
 struct PartMeasures
@@ -53,7 +53,9 @@ struct ConversionDetail
     std::vector<std::string> mainSources; ///< what drives them
 
     std::vector<FootDetail> feet;
-    double sourceFloor = 0.0; ///< y of the source's floor, in its own unit
+    /// y of the source's floor, in its own unit: under its soles, and under its ankles, where it has nothing
+    /// below them, as deep as under the result's.
+    double sourceFloor = 0.0;
 
     /// Where the result's root and the bone that drives it are; from the first frame in x and z, above the
     /// floor in y. Empty where the root or a leg is not mapped.

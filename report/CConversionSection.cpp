@@ -1,6 +1,7 @@
 #include "CConversionSection.h"
 
 #include "FigureDrawing.h"
+#include "PathDrawing.h"
 #include "Tables.h"
 
 #include <algorithm>
@@ -158,11 +159,12 @@ void CConversionSection::AppendCurves(CMarkup& page) const
     chart.curves.push_back({"farthest main bone", "most", detail.largestError});
     chart.curves.push_back({"mean of the main bones", "result", detail.meanError});
     AppendChart(page, chart, m_uiMostPoints);
+    AppendRootHeight(page);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendKnee(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendSole(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
-    AppendRoot(page);
+    AppendPaths(page, detail.sourceRoot, detail.resultRoot, m_uiMostPoints);
 }
 
 Chart CConversionSection::NewChart(const std::string& title, std::string_view unit) const
@@ -192,10 +194,11 @@ void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const
     AppendChart(page, chart, m_uiMostPoints);
 }
 
-void CConversionSection::AppendRoot(CMarkup& page) const
+void CConversionSection::AppendRootHeight(CMarkup& page) const
 {
-    const std::vector<float> source = Heights(m_kMotion.measured->detail.sourceRoot);
-    const std::vector<float> result = Heights(m_kMotion.measured->detail.resultRoot);
+    const ConversionDetail& detail = m_kMotion.measured->detail;
+    const std::vector<float> source = Heights(detail.sourceRoot);
+    const std::vector<float> result = Heights(detail.resultRoot);
     Chart chart = NewChart("Height of the root", "mm above the floor");
     AddBothSides(chart, source, result);
     AppendChart(page, chart, m_uiMostPoints);

@@ -9,48 +9,59 @@ namespace gw {
 
 namespace {
 
-constexpr double kDrawingHeight = 200.0;
+// All drawings of a page are of one size; what the figures need of it decides how large they are.
+constexpr double kWidth = 260.0;
+constexpr double kHeight = 200.0;
 constexpr double kMargin = 8.0;
-constexpr double kMostWidth = 400.0; // a body that lies, arms and legs away
 
-// What the drawings of a pair show, in the figures' unit; the left edge is -halfWidth.
-struct Extent
+struct Range
 {
-    double halfWidth = 0.0;
-    double low = 0.0;
-    double high = 0.0;
+    double least = 0.0;
+    double largest = 0.0;
 
-    void Add(const Vec3& point)
+    void Add(double value)
     {
-        halfWidth =
-            std::max(halfWidth, std::hypot(static_cast<double>(point.x), static_cast<double>(point.z)));
-        low = std::min(low, static_cast<double>(point.y));
-        high = std::max(high, static_cast<double>(point.y));
+        least = std::min(least, value);
+        largest = std::max(largest, value);
     }
-    void Add(const PosedFigure& figure)
-    {
-        for (const std::vector<PosedFigure::Line>* lines : {&figure.lines, &figure.badLines})
-        {
-            for (const PosedFigure::Line& line : *lines)
-            {
-                Add(line[0]);
-                Add(line[1]);
-            }
-        }
-    }
+    double Extent() const { return largest - least; }
 };
 
-// One look at figures: which way is right, and how large.
+template <class Visit>
+void EachPoint(const FigurePair& pair, const Visit& visit)
+{
+    for (const PosedFigure* figure : {&pair.source, &pair.result})
+    {
+        for (const std::vector<PosedFigure::Line>* lines : {&figure->lines, &figure->badLines})
+        {
+            for (const PosedFigure::Line& line : *lines)
+                std::ranges::for_each(line, visit);
+        }
+    }
+}
+
+// One look at the figures. The origin, under their roots on the floor, is always in sight.
 struct Look
 {
-    Vec3 right;
-    Extent extent;
-    double scale;
+    Vec3 right; ///< unit, over the ground
+    Range across;
+    Range height;
+    double scale = 1.0; ///< drawing to figure
 
-    double X(const Vec3& point) const { return (Vec3Dot(point, right) + extent.halfWidth) * scale + kMargin; }
-    double Y(double height) const { return (extent.high - height) * scale + kMargin; }
-    double Width() const { return 2.0 * (extent.halfWidth * scale + kMargin); }
-    double Height() const { return (extent.high - extent.low) * scale + 2.0 * kMargin; }
+    Look(const FigurePair& pair, const Vec3& direction) : right(direction)
+    {
+        EachPoint(pair, [this](const Vec3& point) {
+            across.Add(Vec3Dot(point, right));
+            height.Add(static_cast<double>(point.y));
+        });
+    }
+    double LargestScale() const { return std::min(kWidth / across.Extent(), kHeight / height.Extent()); }
+    double X(const Vec3& point) const
+    {
+        const double middle = 0.5 * (across.least + across.largest);
+        return (Vec3Dot(point, right) - middle) * scale + 0.5 * kWidth + kMargin;
+    }
+    double Y(double y) const { return (height.least - y) * scale + kHeight + kMargin; }
 };
 
 void AppendPoint(CMarkup& page, const Look& look, const Vec3& point)
@@ -75,10 +86,9 @@ void AppendLines(CMarkup& page, const Look& look, const std::vector<PosedFigure:
 void AppendFigure(CMarkup& page, const Look& look, const PosedFigure& figure, std::string_view side,
                   std::string_view from)
 {
-    page.Raw("<figure class=\"").Raw(side).Raw("\"><svg viewBox=\"0 0 ").Number(look.Width(), 0).Raw(" ");
-    page.Number(look.Height(), 0).Raw("\" role=\"img\" aria-label=\"").Raw(side).Raw(", ").Raw(from);
-    page.Raw("\"><path class=\"floor\" d=\"M0 ").Number(look.Y(0.0), 1).Raw("H");
-    page.Number(look.Width(), 0).Raw("\"/>");
+    page.Raw("<figure class=\"").Raw(side).Raw("\"><svg viewBox=\"0 0 276 216\" role=\"img\" aria-label=\"");
+    page.Raw(side).Raw(", ").Raw(from).Raw("\"><path class=\"floor\" d=\"M0 ");
+    page.Number(look.Y(0.0), 1).Raw("H276\"/>");
     AppendLines(page, look, figure.lines, "bones");
     AppendLines(page, look, figure.badLines, "bones bad");
     if (figure.badJoint)
@@ -107,16 +117,12 @@ void PlaceFigure(PosedFigure& figure, double floor, double scale)
 
 void AppendFigures(CMarkup& page, const FigurePair& pair)
 {
-    Extent extent;
-    extent.Add(pair.source);
-    extent.Add(pair.result);
-    const double scale =
-        std::min(kDrawingHeight / std::max(extent.high - extent.low, extent.halfWidth / 10.0),
-                 kMostWidth / (2.0 * std::max(extent.halfWidth, 1e-9)));
+    Look front(pair, pair.across);
+    Look side(pair, Vec3Cross(pair.across, kVec3UnitY));
+    const double scale = std::min(front.LargestScale(), side.LargestScale());
     if (!std::isfinite(scale) || scale <= 0.0)
         return;
-    const Look front{pair.across, extent, scale};
-    const Look side{Vec3Cross(pair.across, kVec3UnitY), extent, scale};
+    front.scale = side.scale = scale;
     page.Raw("<div class=\"figures\">");
     AppendFigure(page, front, pair.source, "source", "from the front");
     AppendFigure(page, front, pair.result, "result", "from the front");

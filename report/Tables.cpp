@@ -153,7 +153,7 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
 
 void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"bone", "source"}, {"mean °", "most °", "at frame", "jitter", "source's jitter"},
+    BeginTable(page, {"bone", "source"}, {"mean °", "most °", "at frame", "jitter", "of source"},
                plain != nullptr);
     for (const BoneMeasures& bone : measured.sums.bones)
     {

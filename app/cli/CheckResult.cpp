@@ -6,6 +6,7 @@
 #include "CShellContent.h"
 #include "CShellWindow.h"
 #include "ConvertFile.h"
+#include "Skeleton.h"
 #include "SourceTiming.h"
 
 namespace gw {
@@ -34,6 +35,19 @@ MotionClip SourceClip(const CShellContent& content)
     return {content.SourceRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
 }
 
+// New tracks rest in the pose that the rules made of the source's rest; a saved result rests in the target's
+// own, and so is it measured.
+void TakeRestPose(const CMotionFile& result)
+{
+    for (const CNode* bone : NodesOf(*result.restRoot))
+    {
+        const CNode* const node = FindNode(result.motionRoot.Get(), bone->GetName());
+        CKeyframeControl* const track = node ? RecordCast<CKeyframeControl>(node->GetControl()) : nullptr;
+        if (track)
+            track->m_kRestMatrix = bone->m_kMatrix;
+    }
+}
+
 } // namespace
 
 ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job)
@@ -41,6 +55,7 @@ ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job
     ConvertedMotion motion;
     motion.source = job.source;
     motion.result = job.output;
+    TakeRestPose(content.ResultMotion());
     motion.sourceClip = SourceClip(content);
     motion.resultClip = ClipOf(content.ResultMotion());
     return motion;

@@ -11,7 +11,7 @@ struct CConversionJob;
 struct COptions;
 
 /// The open source and the result of a content that has converted, as clips of trees that live with it; named
-/// after the job.
+/// after the job. The result is saved already: its tracks take the target's rest pose.
 ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job);
 
 /// Measures these by the profile file that made the one of the other. Nothing where it cannot be read any

@@ -12,6 +12,7 @@
 #include "PackagedMotion.h"
 #include "PageOutput.h"
 #include "Paths.h"
+#include "ProfileFile.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -74,13 +75,13 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
     return misfits.empty();
 }
 
-bool WriteComparison(const COptions& options, const MotionClip& source, const MotionClip& result,
-                     const MeasuredConversion& measured)
+bool WriteComparison(const COptions& options, const std::string& profilePath, const MotionClip& source,
+                     const MotionClip& result, const MeasuredConversion& measured)
 {
     ConvertedMotion motion;
     motion.source = options.files[0];
     motion.result = options.files[1];
-    motion.profile = options.profile;
+    motion.profile = ReadProfileName(profilePath);
     motion.sourceClip = source;
     motion.resultClip = result;
     motion.measured = &measured;
@@ -117,7 +118,8 @@ EExit RunCompare(const COptions& options)
         WriteMeasures(measured.sums);
     else
         PrintMeasures(measured.sums);
-    const bool isWritten = options.html.empty() || WriteComparison(options, sourceClip, resultClip, measured);
+    const bool isWritten =
+        options.html.empty() || WriteComparison(options, profilePath, sourceClip, resultClip, measured);
     return isWritten ? EExit::Done : EExit::Failed;
 }
 

@@ -97,6 +97,25 @@ TEST(ConversionDetail, CurvesStandSideBySideInTheResultsUnit)
     EXPECT_NEAR(detail.resultRoot[0].y, 880.0, 0.1);
 }
 
+// Hips at the origin and nothing below the ankles: the floor is where the result's would be.
+TEST(ConversionDetail, ASourceThatEndsAtItsAnklesStandsAboveItsFloor)
+{
+    CMadeFigure source;
+    CMadeFigure result;
+    for (const std::string side : {"L", "R"})
+    {
+        source.Remove(side + "Foot");
+        source.AddBone(side + "Foot", side + "Calf", {0.0f, -500.0f, 0.0f});
+    }
+    ConversionDetail detail;
+    const MotionClip clip = source.Record(5, kStill);
+    MeasureConversion(clip, result.Record(5, kStill), PairByName(source, result), &detail);
+    ASSERT_EQ(detail.feet.size(), 2u);
+    EXPECT_NEAR(detail.feet[0].sourceSole[2], 0.0, 0.1);
+    EXPECT_NEAR(detail.sourceFloor, -112.5, 0.1);
+    EXPECT_NEAR(detail.sourceRoot[2].y, 900.0, 0.1);
+}
+
 TEST(WorstFrames, AreThoseOfTheFaultsThatWereMade)
 {
     const auto faulty = [](CMadeFigure& figure, int frame) {

@@ -115,7 +115,7 @@ TEST(Page, ShowsTheFramesOfMadeFaultsWithBothSkeletons)
     EXPECT_EQ(frames, 3u);
     EXPECT_EQ(Count(page, "aria-label=\"source, from"), 2 * frames);
     EXPECT_EQ(Count(page, "aria-label=\"result, from"), 2 * frames);
-    EXPECT_EQ(Count(page, "<circle"), 4 * frames);
+    EXPECT_EQ(Count(page, "<circle class=\"bad\""), 4 * frames);
 }
 
 TEST(Page, NeedsNothingFromAnywhere)
@@ -142,6 +142,18 @@ TEST(Page, HostileNamesAreTextAndNothingElse)
     EXPECT_TRUE(Has(page, "&lt;b&gt;&quot;&#39;&amp;\\x1b\\xff\\xc2\\x85&lt;/style&gt;"));
     EXPECT_FALSE(Has(page, "\x1b") || Has(page, "\xff"));
     EXPECT_EQ(CMarkup().Name(std::string(100000, 'x')).Text().size(), 300 + std::string_view("…").size());
+}
+
+TEST(Page, ShowsTheWaysOfBothRootsInOneScale)
+{
+    const auto walking = [](CMadeFigure& figure, int frame) {
+        figure.Move("LowerTorso", {0.0f, 0.0f, 50.0f * static_cast<float>(frame)});
+    };
+    const std::string page = CMadeConversion(walking).Page();
+    const size_t way = page.find("class=\"curve result\"", page.find("Way of the root"));
+    ASSERT_NE(way, page.npos);
+    EXPECT_EQ(page.substr(page.find(" d=", way), 14), " d=\"M150.0 0.0") << "begins at the far edge";
+    EXPECT_TRUE(Has(page, "L150.0 130.0\"")) << "and ends at the near one";
 }
 
 TEST(Page, SaysHowAFigureStandsInWords)
