@@ -96,6 +96,8 @@ EExit RunCompare(const COptions& options)
 {
     if (const EExit page = CheckPagePath(options); page != EExit::Done)
         return page;
+    if (!HasPageFolder(options))
+        return EExit::Failed;
     CSceneFile source;
     CMotionFile result;
     const std::string profilePath = FindProfile(options);
@@ -108,7 +110,8 @@ EExit RunCompare(const COptions& options)
     if (!Pair(profilePath, sourceClip.root, resultClip.root, pairs))
         return EExit::Failed;
     MeasuredConversion measured;
-    measured.sums = MeasureConversion(sourceClip, resultClip, pairs, &measured.detail);
+    ConversionDetail* const detail = options.html.empty() ? nullptr : &measured.detail;
+    measured.sums = MeasureConversion(sourceClip, resultClip, pairs, detail);
     if (measured.sums.frameCount == 0)
     {
         SayError("there is nothing to compare: a motion has no frames");
