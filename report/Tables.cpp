@@ -14,15 +14,17 @@ namespace {
 
 constexpr double kFullBar = 30.0; // degrees at which a bar fills its cell
 
+// Columns of words, the mean error, that of the plain rules where there is one, and the other numbers.
 void BeginTable(CMarkup& page, std::initializer_list<std::string_view> words,
                 std::initializer_list<std::string_view> numbers, bool hasPlain)
 {
     page.Raw("<div class=\"wide\"><table><thead><tr>");
     for (const std::string_view word : words)
         page.Raw("<th class=\"word\">").Raw(word).Raw("</th>");
+    page.Raw(hasPlain ? "<th>mean °</th><th>plain °</th>" : "<th>mean °</th>");
     for (const std::string_view number : numbers)
         page.Raw("<th>").Raw(number).Raw("</th>");
-    page.Raw(hasPlain ? "<th>plain rules</th></tr></thead><tbody>\n" : "</tr></thead><tbody>\n");
+    page.Raw("</tr></thead><tbody>\n");
 }
 
 void EndTable(CMarkup& page)
@@ -53,20 +55,26 @@ void FrameCell(CMarkup& page, int frame)
     page.Raw("<td>").Integer(frame).Raw("</td>");
 }
 
-const BoneMeasures* BoneOf(const MeasuredConversion* measured, const std::string& target)
+const BoneMeasures* BoneOf(const MeasuredConversion& measured, const std::string& target)
 {
-    if (!measured)
-        return nullptr;
-    const auto bone = std::ranges::find(measured->sums.bones, target, &BoneMeasures::target);
-    return bone == measured->sums.bones.end() ? nullptr : &*bone;
+    const auto bone = std::ranges::find(measured.sums.bones, target, &BoneMeasures::target);
+    return bone == measured.sums.bones.end() ? nullptr : &*bone;
 }
 
-const PartMeasures* PartOf(const MeasuredConversion* measured, std::string_view name)
+const PartMeasures* PartOf(const MeasuredConversion& measured, std::string_view name)
 {
-    if (!measured)
-        return nullptr;
-    const auto part = std::ranges::find(measured->detail.parts, name, &PartMeasures::name);
-    return part == measured->detail.parts.end() ? nullptr : &*part;
+    const auto part = std::ranges::find(measured.detail.parts, name, &PartMeasures::name);
+    return part == measured.detail.parts.end() ? nullptr : &*part;
+}
+
+// The column of the plain rules keeps its place where these have no such figure.
+template <class Record>
+void PlainCell(CMarkup& page, const Record* record)
+{
+    if (record)
+        NumberCell(page, record->meanError, 3);
+    else
+        page.Raw("<td></td>");
 }
 
 // Rows of the table of feet. A cell is what its function appends.
@@ -133,7 +141,7 @@ constexpr FootRow kFootRows[] = {
 
 void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"part"}, {"mean °", "most °", "at frame", "in"}, plain != nullptr);
+    BeginTable(page, {"part"}, {"most °", "at frame", "in"}, plain != nullptr);
     for (const PartMeasures& part : measured.detail.parts)
     {
         if (part.boneCount == 0)
@@ -141,11 +149,11 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
         page.Raw("<tr>");
         NameCell(page, part.name);
         BarCell(page, part.meanError);
+        if (plain)
+            PlainCell(page, PartOf(*plain, part.name));
         NumberCell(page, part.largestError, 3);
         FrameCell(page, part.largestFrame);
         NameCell(page, part.largestBone);
-        if (const PartMeasures* other = PartOf(plain, part.name))
-            NumberCell(page, other->meanError, 3);
         page.Raw("</tr>\n");
     }
     EndTable(page);
@@ -153,8 +161,7 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
 
 void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"bone", "source"}, {"mean °", "most °", "at frame", "jitter", "of source"},
-               plain != nullptr);
+    BeginTable(page, {"bone", "source"}, {"most °", "at frame", "jitter", "of source"}, plain != nullptr);
     for (const BoneMeasures& bone : measured.sums.bones)
     {
         if (!bone.measured)
@@ -163,22 +170,22 @@ void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const Me
         NameCell(page, bone.target);
         NameCell(page, bone.source);
         BarCell(page, bone.meanError);
+        if (plain)
+            PlainCell(page, BoneOf(*plain, bone.target));
         NumberCell(page, bone.largestError, 3);
         FrameCell(page, bone.largestFrame);
-        NumberCell(page, bone.resultJitter, 6);
-        NumberCell(page, bone.sourceJitter, 6);
-        if (const BoneMeasures* other = BoneOf(plain, bone.target))
-            NumberCell(page, other->meanError, 3);
+        NumberCell(page, bone.resultJitter, 5);
+        NumberCell(page, bone.sourceJitter, 5);
         page.Raw("</tr>\n");
     }
     page.Raw("<tr class=\"sum\"><td class=\"word\">all</td><td></td>");
     BarCell(page, measured.sums.meanError);
-    NumberCell(page, measured.sums.largestError, 3);
-    page.Raw("<td></td>");
-    NumberCell(page, measured.sums.resultJitter, 6);
-    NumberCell(page, measured.sums.sourceJitter, 6);
     if (plain)
         NumberCell(page, plain->sums.meanError, 3);
+    NumberCell(page, measured.sums.largestError, 3);
+    page.Raw("<td></td>");
+    NumberCell(page, measured.sums.resultJitter, 5);
+    NumberCell(page, measured.sums.sourceJitter, 5);
     page.Raw("</tr>\n");
     EndTable(page);
 }
