@@ -2,16 +2,13 @@
 
 #include "BonePairs.h"
 #include "CPoseSampler.h"
+#include "JointSteps.h"
 
 #include <cmath>
 
 namespace gw {
 
 namespace {
-
-// Joints no farther apart than this, by how far from the origin they are, are at the same place: rounding is
-// a tenth of it, and the shortest bones are a thousand times longer.
-constexpr double kSamePlace = 1e-6;
 
 template <class Visit>
 void EachChild(const CNode& node, const Visit& visit)
@@ -21,20 +18,6 @@ void EachChild(const CNode& node, const Visit& visit)
         if (CNode* child = RecordCast<CNode>(node.ChildAt(i)))
             visit(*child);
     }
-}
-
-CNode* FirstChild(const CNode& node)
-{
-    CNode* first = nullptr;
-    EachChild(node, [&](CNode& child) { first = first ? first : &child; });
-    return first;
-}
-
-bool ArePlacedApart(const CNode& a, const CNode& b)
-{
-    const Vec3 place = a.m_kWorldMatrix.Translation();
-    const Vec3 offset = b.m_kWorldMatrix.Translation() - place;
-    return Vec3Length(offset) > kSamePlace * (1.0 + Vec3Length(place));
 }
 
 // The first mapped bone at or below a node, depth first.
@@ -72,14 +55,6 @@ CNode* NextMapped(const CNode& target, const CSourceTable& sources)
     return next;
 }
 
-// The child of a node on the way down to another, or null where that is not below.
-CNode* ChildTowards(const CNode& node, CNode* below)
-{
-    while (below && below->GetParentNode() != &node)
-        below = below->GetParentNode();
-    return below;
-}
-
 bool IsAbove(const CNode& node, const CNode* below)
 {
     while (below && below != &node)
@@ -97,18 +72,6 @@ CNode* SourceStart(CNode& source, const CNode* next)
     return start ? start : &source;
 }
 
-CNode* JointBelow(const CNode& node, CNode* goal)
-{
-    for (const CNode* at = &node;;)
-    {
-        CNode* child = ChildTowards(*at, goal);
-        child = child ? child : FirstChild(*at);
-        if (!child || ArePlacedApart(node, *child))
-            return child;
-        at = child;
-    }
-}
-
 } // namespace
 
 BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources)
@@ -117,14 +80,6 @@ BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources)
     CNode* const sourceNext = sources.SourceOf(next);
     CNode* const start = SourceStart(*pair.source, sourceNext);
     return {JointBelow(*pair.target, next), JointBelow(*start, sourceNext), start};
-}
-
-CNode* JointAbove(const CNode& node)
-{
-    CNode* parent = node.GetParentNode();
-    while (parent && !ArePlacedApart(node, *parent))
-        parent = parent->GetParentNode();
-    return parent;
 }
 
 } // namespace gw

@@ -18,7 +18,4 @@ struct BoneEnds
 /// parents can be told and passed over.
 BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources);
 
-/// The nearest ancestor that is not at the node's own place in the present pose, or null.
-CNode* JointAbove(const CNode& node);
-
 } // namespace gw

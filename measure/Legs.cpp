@@ -2,6 +2,7 @@
 
 #include "BoneEnds.h"
 #include "CNode.h"
+#include "JointSteps.h"
 
 namespace gw {
 

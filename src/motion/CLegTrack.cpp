@@ -27,15 +27,6 @@ Vec3 ToWorld(const Vec3& direction, const Mat4& world)
     return rows.Row(0) * direction.x + rows.Row(1) * direction.y + rows.Row(2) * direction.z;
 }
 
-// What lies on the floor under a joint in the rest pose, in the joint's space.
-Vec3 SoleUnder(const CNode& joint, double restFloor)
-{
-    const Mat4 world = RestWorld(joint);
-    Vec3 point = world.Translation();
-    point.y = static_cast<float>(restFloor);
-    return TransformCoord(point, Mat4InverseOrIdentity(world));
-}
-
 } // namespace
 
 CLegTrack::CLegTrack(const LegJoints& joints, double restFloor)
@@ -92,6 +83,14 @@ void CLegTrack::Append()
     m_kPostures.push_back(
         {Heading(), static_cast<float>(DegreesBetween(normal, kVec3UnitY)), SoleHeight(),
          static_cast<float>(DegreesBetween(knee - PlaceOf(*m_kJoints.thigh), ankle - knee))});
+}
+
+Vec3 SoleUnder(const CNode& joint, double restFloor)
+{
+    const Mat4 world = RestWorld(joint);
+    Vec3 point = world.Translation();
+    point.y = static_cast<float>(restFloor);
+    return TransformCoord(point, Mat4InverseOrIdentity(world));
 }
 
 double RestFloor(const std::vector<LegJoints>& legs)

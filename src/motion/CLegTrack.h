@@ -65,6 +65,9 @@ private:
     std::vector<Posture> m_kPostures;
 };
 
+/// What lies on the floor under a joint in the rest pose, in the joint's space.
+Vec3 SoleUnder(const CNode& joint, double restFloor);
+
 /// The height on which a skeleton stands in its rest pose: y = 0 where its feet are at or little above it,
 /// else that of the lowest ankle or toe.
 double RestFloor(const std::vector<LegJoints>& legs);

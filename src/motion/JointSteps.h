@@ -1,0 +1,16 @@
+#pragma once
+
+namespace gw {
+
+class CNode;
+
+// From joint to joint of a tree in its present pose. Helper joints that stand at the place of the joint where
+// the step begins are passed over.
+
+/// The nearest ancestor at another place, or null.
+CNode* JointAbove(const CNode& node);
+/// The nearest joint below at another place, on the way to `goal` where that is below, else along first
+/// children; null where there is none.
+CNode* JointBelow(const CNode& node, CNode* goal);
+
+} // namespace gw
