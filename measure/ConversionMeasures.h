@@ -80,7 +80,7 @@ struct FootMeasures
     std::optional<double> contactF1;
 
     /// Knee: the angle between thigh and calf, 0 for a straight leg. A pop is a frame into which it changes
-    /// by over 10 degrees more than the source's knee does.
+    /// by over 5 degrees more than the source's knee does.
     size_t kneePops = 0;
     std::vector<int> kneePopFrames; ///< which these are
     int kneePopFrame = 0;           ///< the frame of the next figure

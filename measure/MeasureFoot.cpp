@@ -12,8 +12,7 @@ namespace gw {
 namespace {
 
 constexpr double kFlatEnough = 0.5; // a foot within 30 degrees of upright has no heading worth the name
-constexpr double kPopDegrees =
-    10.0; // a knee at running speed differs by half of this from one frame to the next
+constexpr double kPopDegrees = 5.0; // what the eye takes for a jerk, in a walk as in a run
 
 std::vector<bool> StandingFrames(const std::vector<Contact>& contacts, size_t frameCount)
 {

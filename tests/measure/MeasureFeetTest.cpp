@@ -272,4 +272,19 @@ TEST(MeasureFeet, KneePopIsAChangeThatTheSourceHasNot)
     EXPECT_EQ(measures.feet[1].kneePops, 0u);
 }
 
+TEST(MeasureFeet, KneePopBeginsAtFiveDegreesBeyondTheSources)
+{
+    for (const double jerk : {4.5, 5.5})
+    {
+        CMadeFigure source;
+        CMadeFigure result;
+        const MotionClip sourceClip = source.Record(20, [](CMadeFigure&, int) {});
+        const MotionClip resultClip = result.Record(20, [=](CMadeFigure& figure, int frame) {
+            figure.Turn("LCalf", kVec3UnitX, frame < 10 ? 0.0 : jerk);
+        });
+        const auto measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+        EXPECT_EQ(measures.feet[0].kneePops, jerk > 5.0 ? 1u : 0u) << jerk;
+    }
+}
+
 } // namespace gw
