@@ -75,6 +75,7 @@ bool CGaitConvertContent::PrepareRetargeter()
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
 {
+    m_kRetargeter->SetFaithful(m_kChoices.faithful);
     m_kRetargeter->SetProgress([this](size_t done, size_t total) { ShowProgress(done, total); });
     m_kRetargeter->Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
     Report(m_kSourcePath, m_kRetargeter->Record());

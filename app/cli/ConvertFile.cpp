@@ -44,6 +44,7 @@ public:
           m_kPlatform(EPlatformWriting::No, options.dataFolder), m_kContent(window, m_kPlatform)
     {
         window.SetPaths(job.source, job.output);
+        m_kContent.SetChoices({options.align, options.faithful});
     }
 
     EConversion Run()

@@ -31,6 +31,8 @@ constexpr COptionRow kOptions[] = {
     Row(kFrameScale, "--frame-scale", "F", &COptions::frameScale, "F times as many frames in the same time"),
     Row(kFix, "--fix", "OUT", &COptions::fix, "write a mended copy of the .bvh, never over itself"),
     Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's stand"),
+    Row(kFaithful, "--faithful", "", &COptions::faithful,
+        "let hips, knees and feet keep to the source, and let feet stand still where its feet stand"),
     Row(kForce, "--force", "", &COptions::force, "replace a file that exists"),
     Row(kSkipExisting, "--skip-existing", "", &COptions::skipExisting,
         "pass over a source whose output exists"),

@@ -1,5 +1,6 @@
 #include "CLegPlanter.h"
 
+#include "CFaithfulLeg.h"
 #include "CKeyframeControl.h"
 #include "Skeleton.h"
 
@@ -66,6 +67,13 @@ bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const c
     std::ranges::reverse(leg.path);
     m_kLegs.push_back(std::move(leg));
     return true;
+}
+
+void CLegPlanter::LeaveOut(const std::vector<CFaithfulLeg>& legs)
+{
+    std::erase_if(m_kLegs, [&](const LegRecord& leg) {
+        return std::ranges::find(legs, leg.thigh, &CFaithfulLeg::Thigh) != legs.end();
+    });
 }
 
 void CLegPlanter::Plant(size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks)

@@ -7,6 +7,7 @@
 
 namespace gw {
 
+class CFaithfulLeg;
 class CKeyframeControl;
 
 /// Plants the feet: turns the thigh and calf of each leg so that the ankle stands where the source's does,
@@ -17,6 +18,9 @@ public:
     /// Plans the legs LThigh to LFoot and RThigh to RFoot. A leg of which a bone or a source is missing is
     /// left alone.
     CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode& targetRoot);
+
+    /// Leaves legs alone from now on that are posed otherwise.
+    void LeaveOut(const std::vector<CFaithfulLeg>& legs);
 
     /// Replaces the rotation keys of a frame where a leg can be solved. `tracks` stand in the order of the
     /// bones; `scale` is the body measure.

@@ -1,6 +1,7 @@
 #include "CLegTrack.h"
 
 #include "CPoseSampler.h"
+#include "Directions.h"
 #include "Figures.h"
 
 namespace gw {
@@ -12,26 +13,11 @@ Vec3 PlaceOf(const CNode& node)
     return node.m_kWorldMatrix.Translation();
 }
 
-// A world direction in the space of a node with a world matrix, and back.
-Vec3 ToLocal(const Vec3& direction, const Mat4& world)
-{
-    const Mat3 rows = NormalizedRows(world);
-    return {static_cast<float>(Vec3Dot(direction, rows.Row(0))),
-            static_cast<float>(Vec3Dot(direction, rows.Row(1))),
-            static_cast<float>(Vec3Dot(direction, rows.Row(2)))};
-}
-
-Vec3 ToWorld(const Vec3& direction, const Mat4& world)
-{
-    const Mat3 rows = NormalizedRows(world);
-    return rows.Row(0) * direction.x + rows.Row(1) * direction.y + rows.Row(2) * direction.z;
-}
-
 } // namespace
 
 CLegTrack::CLegTrack(const LegJoints& joints, double restFloor)
     : m_kJoints(joints), m_kHeelSole(SoleUnder(*joints.ankle, restFloor)),
-      m_kSoleNormal(ToLocal(kVec3UnitY, RestWorld(*joints.ankle)))
+      m_kSoleNormal(ToLocal(kVec3UnitY, NormalizedRows(RestWorld(*joints.ankle))))
 {
     if (HasToe())
         m_kToeSole = SoleUnder(*joints.toe, restFloor);
@@ -58,12 +44,12 @@ Vec3 CLegTrack::Heading() const
 {
     if (HasToe())
         return Vec3Normalized(PlaceOf(*m_kJoints.toe) - PlaceOf(*m_kJoints.ankle));
-    return ToWorld(m_kHeading, m_kJoints.ankle->m_kWorldMatrix);
+    return ToWorld(m_kHeading, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
 }
 
 void CLegTrack::SetHeading(const Vec3& direction)
 {
-    m_kHeading = ToLocal(direction, m_kJoints.ankle->m_kWorldMatrix);
+    m_kHeading = ToLocal(direction, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
 }
 
 float CLegTrack::SoleHeight() const
@@ -76,7 +62,7 @@ void CLegTrack::Append()
 {
     const Vec3 knee = PlaceOf(*m_kJoints.knee);
     const Vec3 ankle = PlaceOf(*m_kJoints.ankle);
-    const Vec3 normal = ToWorld(m_kSoleNormal, m_kJoints.ankle->m_kWorldMatrix);
+    const Vec3 normal = ToWorld(m_kSoleNormal, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
     m_kAnkles.push_back(ankle);
     if (HasToe())
         m_kToes.push_back(PlaceOf(*m_kJoints.toe));

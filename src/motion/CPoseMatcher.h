@@ -38,6 +38,7 @@ public:
     void ReadTranslation(size_t index);
 
     std::vector<Bone>& Bones() { return m_kBones; }
+    const std::vector<Bone>& Bones() const { return m_kBones; }
     /// The bone's local matrix as it stands.
     Mat4 LocalMatrix(size_t index) const;
     /// Brings a bone's world matrix up to date with its local pose and its parent's world matrix.

@@ -13,6 +13,7 @@
 
 namespace gw {
 
+class CFaithfulPose;
 class CKeyframeControl;
 class CPoseMatcher;
 
@@ -69,6 +70,11 @@ public:
     bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition,
                   bool resetOrigin, bool useLegs);
 
+    /// Whether runs from now on let hips, knees and feet keep to the source instead (CFaithfulPose), as far
+    /// as its legs are mapped from thigh to foot. `useLegs` then tells whether feet are held where they
+    /// stand.
+    void SetFaithful(bool faithful) { m_bFaithful = faithful; }
+
     /// What a run calls now and then, with the frames done and their number.
     void SetProgress(std::function<void(size_t, size_t)> progress) { m_kProgress = std::move(progress); }
 
@@ -76,9 +82,21 @@ public:
     const CFailureRecord& Record() const { return m_kRecord; }
 
 private:
+    /// What a run was asked for.
+    struct Run
+    {
+        float frequency;
+        const Vec3& rootPosition;
+        bool resetOrigin;
+        bool useLegs;
+    };
+
     float MeasuredScale();
-    void PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks, float frequency,
-                    const Vec3& rootPosition, bool resetOrigin, bool useLegs);
+    void PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks, const Run& run,
+                    CFaithfulPose* keeper);
+    void MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks, const Run& run,
+                     CFaithfulPose* keeper);
+    void ShowProgress(size_t done, size_t total) const;
 
     std::map<const CNode*, CBoneShares> m_kBoneShares;
     std::map<const CNode*, CNode*> m_kSourceOf;
@@ -87,6 +105,7 @@ private:
     std::map<const CNode*, Mat3> m_kOffsetMatrices;
     CNode* m_pkSourceRoot = nullptr;
     CNode* m_pkTargetRoot = nullptr;
+    bool m_bFaithful = false;
     CFailureRecord m_kRecord;
     std::function<void(size_t, size_t)> m_kProgress;
 };

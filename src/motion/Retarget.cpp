@@ -2,19 +2,19 @@
 // looked at (CSourceSampler), how the target's bones share their rotations (CPoseMatcher), which bones make a
 // leg (CLegPlanter), and the tracks at their full length. The loop touches arrays and allocates nothing.
 
-#include "BoneMeshQueries.h"
-#include "CBoneMesh.h"
+#include "CFaithfulPose.h"
 #include "CGeometry.h"
 #include "CKeyframeControl.h"
 #include "CLegPlanter.h"
 #include "CMotionFile.h"
 #include "CPoseMatcher.h"
+#include "CPoseSampler.h"
 #include "CRetargeter.h"
+#include "CSourceSampler.h"
 #include "Skeleton.h"
 
 #include <algorithm>
 #include <cmath>
-#include <unordered_set>
 
 namespace gw {
 
@@ -28,42 +28,7 @@ constexpr uint64_t kResultBytesLimit = uint64_t{1} << 31;
 constexpr uint64_t kKeyBytes = sizeof(float) + sizeof(Quat) + 2 * sizeof(Vec3);
 
 constexpr size_t kProgressFrames = 64;
-
-// Brings the source nodes that a conversion looks at, and those above them, to a time, each once. The rest of
-// the source (fingers, meshes, bounds) is left as it is until the end.
-class CSourceSampler
-{
-public:
-    CSourceSampler(CNode* root, const std::vector<CNode*>& wanted)
-    {
-        std::unordered_set<const CSpatial*> known;
-        for (CNode* node : wanted)
-            Add(*node, root, known);
-    }
-    void Sample(float time) const
-    {
-        for (CSpatial* spatial : m_kOrder)
-            spatial->CSpatial::UpdateTransform(time);
-    }
-
-private:
-    void Add(CNode& node, const CSpatial* root, std::unordered_set<const CSpatial*>& known)
-    {
-        std::vector<CSpatial*> path;
-        for (CSpatial* spatial = &node; spatial && known.insert(spatial).second;
-             spatial = spatial->GetParent())
-        {
-            path.push_back(spatial);
-            if (spatial == root)
-                break;
-        }
-        m_kOrder.insert(m_kOrder.end(), path.rbegin(), path.rend());
-        if (CBoneMesh* mesh = FindBoneMesh(node); mesh && known.insert(mesh).second)
-            m_kOrder.push_back(mesh);
-    }
-
-    std::vector<CSpatial*> m_kOrder; // parents first
-};
+constexpr float kUsualFrameSeconds = 1.0f / 30.0f; // where a source gives no usable one
 
 void RestPose(CNode& root)
 {
@@ -191,6 +156,7 @@ bool CRetargeter::Retarget(float begin, float last, float phase, float frequency
         node->DetachControls();
 
     CPoseMatcher matcher(*this, target);
+    CFaithfulPose keeper(*this, matcher, m_bFaithful ? &target : nullptr);
     matcher.Match();
     matcher.WriteNodes();
     GroundTarget(target, 0.0f);
@@ -213,7 +179,8 @@ bool CRetargeter::Retarget(float begin, float last, float phase, float frequency
         bone.node->AttachControl(track.Get());
         tracks.push_back(track.Get());
     }
-    PoseFrames(matcher, tracks, frequency, rootPosition, resetOrigin, useLegs);
+    const Run run{frequency, rootPosition, resetOrigin, useLegs};
+    PoseFrames(matcher, tracks, run, keeper.Legs().empty() ? nullptr : &keeper);
 
     source.UpdateScene(0.0f, true);
     target.UpdateScene(0.0f, true);
@@ -231,30 +198,61 @@ float CRetargeter::MeasuredScale()
     return 1.0f;
 }
 
+// One round over the frames; with legs that keep to the source a second one, since what they do in a frame
+// hangs on those before and after it.
 void CRetargeter::PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks,
-                             float frequency, const Vec3& rootPosition, bool resetOrigin, bool useLegs)
+                             const Run& run, CFaithfulPose* keeper)
 {
     UpdateWorlds(*m_pkTargetRoot);
+    const Vec3 targetBase = m_pkTargetRoot->m_kWorldMatrix.Translation();
+    MatchFrames(matcher, tracks, run, keeper);
+    if (!keeper)
+        return;
+    const size_t frameCount = tracks.front()->m_kKeyTimes.size();
+    keeper->Plan(tracks, run.rootPosition + (run.resetOrigin ? kVec3Zero : targetBase),
+                 IsFrameTime(run.frequency) ? run.frequency : kUsualFrameSeconds, run.useLegs);
+    for (size_t frame = 0; frame < frameCount; ++frame)
+    {
+        keeper->WriteFrame(frame, tracks);
+        ShowProgress(frameCount + frame, 2 * frameCount);
+    }
+}
+
+void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks,
+                              const Run& run, CFaithfulPose* keeper)
+{
     const float scale = MeasuredScale();
     const size_t frameCount = tracks.front()->m_kKeyTimes.size();
     SwitchControls(*m_pkSourceRoot, true);
 
-    const CSourceSampler sampler(m_pkSourceRoot, matcher.SourceNodes());
+    CSourceSampler sampler(m_pkSourceRoot, matcher.SourceNodes());
     CRootPath path(SourceOf(m_pkTargetRoot), *m_pkTargetRoot, scale);
     CLegPlanter legs(*this, matcher, *m_pkTargetRoot);
+    if (keeper)
+    {
+        sampler.Add(keeper->SourceJoints());
+        legs.LeaveOut(keeper->Legs());
+    }
     auto& bones = matcher.Bones();
     bones.front().posed = true; // the root moves even where nothing turns it
     for (size_t frame = 0; frame < frameCount; ++frame)
     {
-        sampler.Sample(static_cast<float>(frame) / frequency);
+        sampler.Sample(static_cast<float>(frame) / run.frequency);
         matcher.Match();
-        bones.front().translation = rootPosition + path.Advance(frame == 0 && resetOrigin);
+        bones.front().translation = run.rootPosition + path.Advance(frame == 0 && run.resetOrigin);
         WriteKeys(bones, tracks, frame);
-        if (useLegs)
+        if (run.useLegs)
             legs.Plant(frame, scale, tracks);
-        if (m_kProgress && frame % kProgressFrames == 0)
-            m_kProgress(frame, frameCount);
+        if (keeper)
+            keeper->Append();
+        ShowProgress(frame, keeper ? 2 * frameCount : frameCount);
     }
+}
+
+void CRetargeter::ShowProgress(size_t done, size_t total) const
+{
+    if (m_kProgress && done % kProgressFrames == 0)
+        m_kProgress(done, total);
 }
 
 } // namespace gw

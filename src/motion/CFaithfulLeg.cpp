@@ -1,0 +1,117 @@
+#include "CFaithfulLeg.h"
+
+#include "Directions.h"
+#include "JointSteps.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+size_t IndexOf(const CPoseMatcher& matcher, const CNode* node)
+{
+    return static_cast<size_t>(matcher.IndexOf(node));
+}
+
+double SegmentLength(const CNode& joint)
+{
+    return Vec3Length(joint.m_kMatrix.Translation());
+}
+
+// The direction from one joint to the next; the one before where they stand at one place.
+Vec3 DirectionOr(const Vec3& before, const CNode& from, const CNode& to)
+{
+    const Vec3 direction =
+        Vec3Normalized(to.m_kWorldMatrix.Translation() - from.m_kWorldMatrix.Translation());
+    return direction == kVec3Zero ? before : direction;
+}
+
+// The rules take a leg's bones for joints one below the other.
+bool IsWhole(const LegJoints& leg)
+{
+    return leg.thigh && leg.knee && leg.ankle;
+}
+
+std::vector<size_t> PathTo(const CPoseMatcher& matcher, const CNode& joint)
+{
+    std::vector<size_t> path;
+    for (const CNode* node = &joint; node && matcher.IndexOf(node) >= 0; node = node->GetParentNode())
+        path.push_back(IndexOf(matcher, node));
+    std::ranges::reverse(path);
+    return path;
+}
+
+} // namespace
+
+std::optional<CFaithfulLeg> CFaithfulLeg::Plan(const CRetargeter& retargeter, const CPoseMatcher& matcher,
+                                               const LegJoints& target, double restFloor)
+{
+    if (!IsWhole(target) || target.ankle->GetParentNode() != target.knee ||
+        target.knee->GetParentNode() != target.thigh)
+        return std::nullopt;
+    LegJoints source{retargeter.SourceOf(target.thigh), retargeter.SourceOf(target.knee),
+                     retargeter.SourceOf(target.ankle)};
+    if (!IsWhole(source) || source.thigh == source.knee || source.knee == source.ankle)
+        return std::nullopt;
+    source.toe = JointBelow(*source.ankle, retargeter.SourceOf(target.toe));
+    return CFaithfulLeg(matcher, source, target, restFloor);
+}
+
+CFaithfulLeg::CFaithfulLeg(const CPoseMatcher& matcher, const LegJoints& source, const LegJoints& target,
+                           double restFloor)
+    : m_kSource(source), m_uiThigh(IndexOf(matcher, target.thigh)), m_uiCalf(IndexOf(matcher, target.knee)),
+      m_uiFoot(IndexOf(matcher, target.ankle)),
+      m_iToe(matcher.IndexOf(target.toe)), m_kLengths{SegmentLength(*target.knee),
+                                                      SegmentLength(*target.ankle)},
+      m_kHeelSole(SoleUnder(*target.ankle, restFloor)),
+      m_kPath(PathTo(matcher, target.toe ? *target.toe : *target.ankle))
+{
+    if (target.toe)
+        m_fToeSole = static_cast<float>(Vec3Length(SoleUnder(*target.toe, restFloor)));
+}
+
+void CFaithfulLeg::AppendSource()
+{
+    const Frame before = m_kFrames.empty() ? Frame{-kVec3UnitY, -kVec3UnitY} : m_kFrames.back();
+    m_kFrames.push_back({DirectionOr(before.thigh, *m_kSource.thigh, *m_kSource.knee),
+                         DirectionOr(before.shin, *m_kSource.knee, *m_kSource.ankle)});
+}
+
+void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame)
+{
+    const auto& bones = matcher.Bones();
+    const Mat4& ankle = bones[m_uiFoot].world;
+    Frame& at = m_kFrames[frame];
+    float lowest = TransformCoord(m_kHeelSole, ankle).y;
+    if (m_iToe >= 0)
+    {
+        const Vec3 toe = bones[static_cast<size_t>(m_iToe)].world.Translation();
+        lowest = std::min(lowest, toe.y - m_fToeSole);
+        at.toe = toe - ankle.Translation();
+    }
+    const Mat4& thigh = bones[m_uiThigh].world;
+    at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
+    at.sole = ankle.Translation().y - lowest;
+    m_kForward = m_kForward + ToLocal(at.thigh - at.shin, NormalizedRows(thigh));
+}
+
+Vec3 CFaithfulLeg::Stretch(size_t frame) const
+{
+    const Frame& at = m_kFrames[frame];
+    return at.thigh * static_cast<float>(m_kLengths.upper) + at.shin * static_cast<float>(m_kLengths.lower);
+}
+
+double CFaithfulLeg::KneeAngle(size_t frame) const
+{
+    const Frame& at = m_kFrames[frame];
+    return std::atan2(Vec3Length(Vec3Cross(at.thigh, at.shin)), Vec3Dot(at.thigh, at.shin));
+}
+
+Vec3 CFaithfulLeg::Forward(const CPoseMatcher& matcher) const
+{
+    return ToWorld(m_kForward, NormalizedRows(matcher.Bones()[m_uiThigh].world));
+}
+
+} // namespace gw

@@ -1,0 +1,30 @@
+#pragma once
+
+#include <unordered_set>
+#include <vector>
+
+namespace gw {
+
+class CNode;
+class CSpatial;
+
+/// Brings the source nodes that a conversion looks at, those above them and their bone meshes to a time, each
+/// once. The rest of the source (fingers, meshes, bounds) is left as it is.
+class CSourceSampler
+{
+public:
+    CSourceSampler(const CNode* root, const std::vector<CNode*>& wanted);
+
+    /// Looks at more nodes.
+    void Add(const std::vector<CNode*>& wanted);
+    void Sample(float time) const;
+
+private:
+    void Add(CNode& node);
+
+    const CSpatial* m_pkRoot;
+    std::unordered_set<const CSpatial*> m_kKnown;
+    std::vector<CSpatial*> m_kOrder; // parents first
+};
+
+} // namespace gw
