@@ -113,6 +113,20 @@ class Convert(CliTest):
         self.assertTrue(changed)
         self.assertLessEqual(changed, {"LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
 
+    def test_a_faithful_result_keeps_to_the_source_and_differs_in_root_and_legs_alone(self):
+        for name, options in (("plain.htr", []), ("faithful.htr", ["--faithful"])):
+            self.succeed("convert", "walk.bvh", "-o", name, *options)
+        nodes = [json.loads(self.run_program("pose", name, "--frame", 40).out)["nodes"]
+                 for name in ("plain.htr", "faithful.htr")]
+        changed = {a["name"] for a, b in zip(*nodes) if a["local"] != b["local"]}
+        self.assertEqual(changed, {"LowerTorso", "LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
+        measures = json.loads(self.succeed("compare", "walk.bvh", "faithful.htr", "--profile", "Poser BVH",
+                                           "--json").out)
+        self.assertAlmostEqual(measures["travelRatio"], 1, delta=0.01)
+        for bone in measures["bones"]:
+            if bone["target"][1:] in ("Thigh", "Calf"):
+                self.assertLess(bone["meanError"], 1, bone["target"])
+
     def test_a_full_disk_is_said_and_leaves_the_old_file(self):
         for arguments in (["-o", "old.Kinetra", "--force"], ["-o", "old.htr", "--force"], ["-o", "new.Kinetra"]):
             with self.subTest(arguments[1]):
