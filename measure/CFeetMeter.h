@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CFeetTrack.h"
 #include "ConversionDetail.h"
 #include "ConversionMeasures.h"
 #include "Legs.h"

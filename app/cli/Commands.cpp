@@ -14,8 +14,8 @@ constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_
     return {name, operands, options, required, run, help, example, choice};
 }
 
-constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kForce | kSkipExisting |
-                                     kDryRun | kKeepGoing | kCheck | kHtml;
+constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kFaithful | kForce |
+                                     kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml;
 
 constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
 
@@ -23,10 +23,12 @@ constexpr CCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
         "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
         "Without --profile the stock profile that fits is taken, else the installed one that fits best: all\n"
-        "rows must fit, most rows win. It is told which one and how sure it is; one whose left and right, or\n"
-        "whose arm and clavicle, lie wrong is only taken by its name. A prefix that the names of the source\n"
-        "share (Model_, mixamorig3:) is put before those of the profile.\n"
-        "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.",
+        "rows must fit, most rows win. It is told which one and how sure it is; one whose left and right,\n"
+        "or whose arm and clavicle, lie wrong is only taken by its name. A prefix that the names of the\n"
+        "source share (Model_, mixamorig3:) is put before those of the profile.\n"
+        "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.\n"
+        "--check measures each result and names its worst frames; --html PAGE writes all of that as a page\n"
+        "for a browser, of several sources with a table that begins with the worst.",
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
     Row("batch", "FOLDER", kJob | kProfile, kJob, RunBatchFolder,
         "Convert every .bvh of a folder to an .htr beside it, or package every .htr.\n"
@@ -63,20 +65,20 @@ constexpr CCommand kCommands[] = {
         "gaitwright doctor walk.bvh --fix mended.bvh"),
     Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
         "List the installed profiles; with a source, which fit and what the others miss.\n"
-        "The first one is what 'convert' takes. Those that fit tell how sure they are (sure, likely, doubtful)\n"
-        "and what speaks against them; of the others, those that fit by half tell what they miss, and --json\n"
-        "tells it of all.",
+        "The first one is what 'convert' takes. Those that fit tell how sure they are (sure, likely,\n"
+        "doubtful) and what speaks against them; of the others, those that fit by half tell what they\n"
+        "miss, and --json tells it of all.",
         "gaitwright profiles walk.bvh"),
     Row("suggest", "SOURCE", kOutput | kForce, kOutput, RunSuggest,
         "Make a profile for a skeleton that no installed one fits.\n"
-        "Joints are found by their names, else by the shape of the skeleton: mirrored limbs, which end is "
-        "up,\n"
-        "where the feet point. Every row is listed with what it is taken from and how sure that is; look at\n"
-        "the rows that are called unsure before you convert many files with the profile.\n"
+        "Joints are found by their names, else by the shape of the skeleton: mirrored limbs, which end\n"
+        "is up, where the feet point. Every row is listed with what it is taken from and how sure that is;\n"
+        "look at the rows that are called unsure before you convert many files with the profile.\n"
         "OUT ends in .prf. Convert with --profile OUT, or keep it with your own profiles.",
         "gaitwright suggest strange.bvh -o strange.prf"),
-    Row("compare", "SOURCE RESULT", kProfile, kProfile, RunCompare,
-        "Measure a conversion: how far the result's bones, feet and path differ.",
+    Row("compare", "SOURCE RESULT", kProfile | kHtml | kForce, kProfile, RunCompare,
+        "Measure a conversion: how far the result's bones, feet and path differ.\n"
+        "--html PAGE writes the figures with curves over time and the worst frames as a page for a browser.",
         "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),
     Row("render", "FILE", kRenderOptions, kOutput, RunRender,
         "Draw a motion into a PNG picture, with its result beside it or under it; needs no display.\n"

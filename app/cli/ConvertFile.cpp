@@ -6,6 +6,8 @@
 #include "CJsonWriter.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
+#include "CheckReport.h"
+#include "CheckResult.h"
 #include "DoubtWords.h"
 #include "Output.h"
 #include "ProfileChoice.h"
@@ -31,6 +33,8 @@ struct Account
     std::string profilePath;
     int frames = 0;
     std::optional<CProfileFit> misfit;
+    std::optional<MeasuredConversion> check;
+    std::optional<MeasuredConversion> plainCheck; // of the same motion by the plain rules
     std::optional<ProfileChoice> chosen; ///< a profile that was neither named nor the stock one of old
 };
 
@@ -152,6 +156,28 @@ EConversion Decide(const COptions& options, const CConversionJob& job, CShellWin
         return CConversion(options, job, window, account, page).Run();
     window.Report(*refusal);
     return EConversion::Failed;
+}
+
+void PrintChecks(const Account& account)
+{
+    if (account.check)
+        PrintCheck(*account.check, "check");
+    if (account.plainCheck)
+        PrintCheck(*account.plainCheck, "by the plain rules");
+}
+
+void WriteChecks(CJsonWriter& json, const Account& account)
+{
+    if (!account.check)
+        return;
+    json.Key("check").BeginObject();
+    WriteCheck(json, *account.check);
+    json.EndObject();
+    if (!account.plainCheck)
+        return;
+    json.Key("plainCheck").BeginObject();
+    WriteCheck(json, *account.plainCheck);
+    json.EndObject();
 }
 
 // How sure the choice is stands behind a profile that was chosen.
