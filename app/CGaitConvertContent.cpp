@@ -24,6 +24,12 @@ void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
         view->SetScene(root, timing.FrameStep(), timing.lastFrame);
 }
 
+// Whether an alignment mends what a reader warns of.
+bool IsAligned(EFailure reason)
+{
+    return reason == EFailure::RestPose || reason == EFailure::DoubledOffsets;
+}
+
 } // namespace
 
 CGaitConvertContent::CGaitConvertContent(CContentWindow& window, CPlatform& platform)
@@ -214,7 +220,10 @@ void CGaitConvertContent::Report(const std::string& path, const CFailureRecord& 
     if (record.Failure())
         m_kWindow.Report(MakeReport(path, record.Failure(), false));
     for (const CFailure& warning : record.Warnings())
-        m_kWindow.Report(MakeReport(path, warning, true));
+    {
+        if (!m_kChoices.align || !IsAligned(warning.reason))
+            m_kWindow.Report(MakeReport(path, warning, true));
+    }
 }
 
 } // namespace gw

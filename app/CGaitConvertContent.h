@@ -1,5 +1,6 @@
 #pragma once
 
+#include "AlignReport.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
 #include "COrrinStream.h"
@@ -73,6 +74,12 @@ public:
     /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
     /// reported.
     bool WriteResult(const std::string& path);
+    /// Writes the source as a BVH file that is told from a rest pose which suits the rules, by the body that
+    /// the selected profile's rows tell of it; AlignedReport says what was mended. Replaces what is there.
+    /// False, with the reason reported, where nothing was written.
+    bool WriteAligned(const std::string& path);
+    /// What the last alignment found.
+    const AlignReport& AlignedReport() const { return m_kAlignReport; }
     /// Whether the present result may be dropped; asks when it is not saved.
     bool ConfirmDiscard();
     /// Asks the editor, then for the result: whether the window may close.
@@ -151,8 +158,14 @@ private:
     std::string BaseFile() { return ExeFile("base.htr"); }
     void Report(const std::string& path, const CFailureRecord& record);
 
+    // AlignSource.cpp
+    bool AlignSource(const SourceTiming& timing);
+    void ReportRestMisfits();
+
     // ConvertMotion.cpp
+    SourceTiming ConversionTiming() const;
     bool PrepareRetargeter();
+    bool PrepareSource(const SourceTiming& timing);
     void Retarget(const SourceTiming& timing, bool useLegs);
     void ShowProgress(size_t done, size_t total);
     void NormalizeBasePose();
@@ -218,6 +231,8 @@ private:
     std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                     ///< what SetTitle was given last
     ConversionChoices m_kChoices;
+    Ref<CNode> m_spkAligned; ///< what the retargeter reads in the source's place; null for the source itself
+    AlignReport m_kAlignReport;
     bool m_bConverted = false;              ///< a conversion has been made for the open source
     bool m_bSaved = true;                   ///< the result has been saved, or there was none
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's

@@ -85,12 +85,13 @@ CGaitConvertContent::EBatchStep CGaitConvertContent::ConvertFile(const std::stri
     m_kSourcePath = path;
     RememberFolder(path);
     ShowSource();
-    if (!SelectProfileAgain() || !PrepareRetargeter())
+    const SourceTiming timing = TimingOf(m_kSourceMotion);
+    if (!SelectProfileAgain() || !PrepareRetargeter() || !PrepareSource(timing))
     {
         ShowMessage(kCannotConvertMessage, EButtons::OK);
         return EBatchStep::Abandoned;
     }
-    Retarget(TimingOf(m_kSourceMotion), true); // Shift has no say here
+    Retarget(timing, true); // Shift has no say here
     m_kWriteRecord.Clear();
     const bool saved = SaveMotion(WithExtension(path, ".htr"), kBatchRate);
     Report(path, m_kWriteRecord);

@@ -44,14 +44,14 @@ int CGaitConvertContent::ConvertMotion()
     LoadMotion(m_kResultMotion, BaseFile());
     if (m_pkProfile)
         m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
-    if (!PrepareRetargeter())
+    const SourceTiming timing = ConversionTiming();
+    if (!PrepareRetargeter() || !PrepareSource(timing))
     {
         ShowMessage(kCannotConvertMessage, EButtons::OK);
         return 0;
     }
     const bool useLegs = !m_kWindow.IsKeyDown(EKey::LeftShift);
-    Retarget(m_bSourceIsContainer ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(m_kSourceMotion),
-             useLegs);
+    Retarget(timing, useLegs);
     if (m_pkSourceView)
         m_pkSourceView->Seek(0, kScrollRange);
     m_bConverted = true;
@@ -71,6 +71,21 @@ bool CGaitConvertContent::PrepareRetargeter()
     if (!ready)
         ReportMisfit();
     return ready;
+}
+
+SourceTiming CGaitConvertContent::ConversionTiming() const
+{
+    return m_bSourceIsContainer ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(m_kSourceMotion);
+}
+
+// The aligned copy of a conversion before is of no use any more, be it of the same source.
+bool CGaitConvertContent::PrepareSource(const SourceTiming& timing)
+{
+    m_spkAligned = nullptr;
+    if (m_kChoices.align)
+        return AlignSource(timing);
+    ReportRestMisfits();
+    return true;
 }
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)

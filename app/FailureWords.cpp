@@ -83,6 +83,10 @@ constexpr Words<EMisfit> kMisfits[] = {
         "choose one that fits the source's bones"),
     Row(EMisfit::NoRootRow, "no-root-row", "no row of the profile drives the target's root bone", kMapHip),
     Row(EMisfit::NoRootSource, "no-root-source", "the profile keeps the target's root bone fixed", kMapHip),
+    Row(EMisfit::NoBody, "no-body", "the profile tells too little of a body to align the motion by",
+        "map hip, both thighs and neck or head"),
+    Row(EMisfit::TurnedAtRest, "turned-at-rest", "limbs may come out turned, as their bones stand at rest",
+        "align the motion, or set rotation offsets in the profile"),
 };
 
 template <class Reason, size_t count>

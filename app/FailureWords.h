@@ -9,13 +9,15 @@
 
 namespace gw {
 
-/// Why a motion cannot be converted although it could be read.
+/// Why a motion cannot be converted although it could be read, or not well.
 enum class EMisfit : uint8_t
 {
     NoScene,      ///< no source is open, or base.htr could not be read
     NoProfile,    ///< no profile is selected
     NoRootRow,    ///< no row drives the target's root bone
     NoRootSource, ///< the row of the target's root bone is fixed
+    NoBody,       ///< the rows drive too little of a body to align it by
+    TurnedAtRest, ///< rows turn limbs when the source stands at rest; `name` is one of its joints
 };
 
 /// The short fixed word for a reason.

@@ -338,6 +338,11 @@ char* WriteFixed6(char* out, float value)
     return out + 7;
 }
 
+char* WriteShortest(char* out, float value)
+{
+    return std::to_chars(out, out + kShortestBytes, value, std::chars_format::fixed).ptr;
+}
+
 char* WriteInt(char* out, int32_t value)
 {
     return std::to_chars(out, out + kIntBytes, value).ptr;

@@ -40,6 +40,11 @@ inline constexpr size_t kFixed6Bytes = 48;
 /// Writes a number as "%f" does in the C locale ("-0.000000", "inf", "-nan" included) and answers the end of
 /// it. Exact, also where a float's decimal expansion is cut.
 char* WriteFixed6(char* out, float value);
+/// The most bytes that WriteShortest writes: sign, "0.", 44 zeros and nine digits.
+inline constexpr size_t kShortestBytes = 64;
+/// Writes a number in the fewest decimals that read back as the same float, without an exponent, and answers
+/// the end of it.
+char* WriteShortest(char* out, float value);
 /// The most bytes that WriteInt writes.
 inline constexpr size_t kIntBytes = 12;
 /// Writes a number as "%d" does and answers the end of it.

@@ -174,6 +174,19 @@ void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z)
     z = angles.z;
 }
 
+Vec3 EulerDegreesZYX(const Mat3& m)
+{
+    const float* e = m.m;
+    const double z = std::atan2(static_cast<double>(e[1]), static_cast<double>(e[0]));
+    const double y = std::atan2(-static_cast<double>(e[2]), std::hypot(e[0], e[1]));
+    // What is left when z is taken off again turns about X alone in these two rows.
+    const double c = std::cos(z);
+    const double s = std::sin(z);
+    const double x = std::atan2(e[6] * s - e[7] * c, e[4] * c - e[3] * s);
+    const double factor = kRadiansToDegrees64;
+    return {static_cast<float>(x * factor), static_cast<float>(y * factor), static_cast<float>(z * factor)};
+}
+
 Mat3 UpAxisMatrix(char letter)
 {
     switch (letter)

@@ -31,6 +31,10 @@ void Mat3ToEuler(const Mat3& m, int order, float& x, float& y, float& z);
 void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z);
 Vec3 Mat3ToEulerDegrees(const Mat3& m);
 
+/// The angles in degrees about X, Y and Z, -180 to 180, that give a "ZYX" matrix back in every case: near a
+/// quarter turn about Y, where those of X and Z run into each other, one takes up what the other is off.
+Vec3 EulerDegreesZYX(const Mat3& m);
+
 /// What turns +Y into a file's bone axis: 'X', 'Z', or the identity for any other letter.
 Mat3 UpAxisMatrix(char letter);
 

@@ -14,8 +14,8 @@ constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_
     return {name, operands, options, required, run, help, example, choice};
 }
 
-constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kFaithful | kForce |
-                                     kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml;
+constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |
+                                     kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml;
 
 constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
 
@@ -27,6 +27,9 @@ constexpr CCommand kCommands[] = {
         "or whose arm and clavicle, lie wrong is only taken by its name. A prefix that the names of the\n"
         "source share (Model_, mixamorig3:) is put before those of the profile.\n"
         "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.\n"
+        "With --align the source is first told from a T-pose, as by 'gaitwright align', and every mapped\n"
+        "bone points as its source does: of the profile only the names count, since its rotations and axes\n"
+        "were made against the source's own rest pose.\n"
         "--check measures each result and names its worst frames; --html PAGE writes all of that as a page\n"
         "for a browser, of several sources with a table that begins with the worst.",
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
@@ -45,6 +48,15 @@ constexpr CCommand kCommands[] = {
     Row("transcode", "IN OUT", kFrameScale | kForce, 0, RunTranscode,
         "Write an .htr with more or fewer frames, or any motion as a .bvh.",
         "gaitwright transcode walk.htr slow.htr --frame-scale 2"),
+    Row("align", "SOURCE", kOutput | kProfile | kForce, kOutput, RunAlign,
+        "Write a motion as a .bvh with the same joints at the same places, told from a T-pose.\n"
+        "In the zero pose the figure faces +Z with Y up and every limb along its axis, whatever the "
+        "source's\n"
+        "is: an A-pose, hanging arms, bones along X, Z up, slanted bones whose frames are turned, positions\n"
+        "that repeat the offsets. A motion whose up axis is not Y is turned as a whole. Which joints are "
+        "which\n"
+        "is told by --profile, else by the installed profile that fits best.",
+        "gaitwright align walk.bvh -o walk-aligned.bvh"),
     Row("resave", "IN OUT", kForce, 0, RunResave,
         "Read a container and write it again, in the newest version.", "gaitwright resave old.orn new.orn"),
     Row("dump", "FILE", kOutputFolder, kOutputFolder, RunDump,

@@ -73,5 +73,6 @@ EExit RunCompare(const COptions& options);
 EExit RunDump(const COptions& options);
 EExit RunRender(const COptions& options);
 EExit RunDoctor(const COptions& options);
+EExit RunAlign(const COptions& options);
 
 } // namespace gw

@@ -33,6 +33,8 @@ constexpr COptionRow kOptions[] = {
     Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's stand"),
     Row(kFaithful, "--faithful", "", &COptions::faithful,
         "let hips, knees and feet keep to the source, and let feet stand still where its feet stand"),
+    Row(kAlign, "--align", "", &COptions::align,
+        "let bones point as the source's do, whatever its rest pose; the profile's offsets have no say"),
     Row(kForce, "--force", "", &COptions::force, "replace a file that exists"),
     Row(kSkipExisting, "--skip-existing", "", &COptions::skipExisting,
         "pass over a source whose output exists"),

@@ -33,4 +33,12 @@ const Mat4& NodeBoneWorld(const CNode& node)
     return mesh ? mesh->m_kWorldMatrix : node.m_kWorldMatrix;
 }
 
+Vec3 NodeBoneEnd(const CNode& node)
+{
+    const CBoneMesh* mesh = FindBoneMesh(node);
+    if (!mesh || mesh->m_kEnd != kVec3Zero)
+        return mesh ? mesh->m_kEnd : kVec3Zero;
+    return TransformCoord(mesh->Axis() * mesh->m_fLength, mesh->m_kMatrix);
+}
+
 } // namespace gw

@@ -16,4 +16,8 @@ Vec3 NodeBoneAxis(const CNode& node);
 /// The world matrix of that mesh, the node's own without one.
 const Mat4& NodeBoneWorld(const CNode& node);
 
+/// Where the bone of a node without children ends, in the node's space: as the file told it, else as that
+/// mesh shows it. Zero without a mesh or a length.
+Vec3 NodeBoneEnd(const CNode& node);
+
 } // namespace gw

@@ -21,6 +21,9 @@ public:
     virtual Vec3 Axis() const { return kVec3Zero; }
 
     float m_fLength = 0.0f; ///< given to the last Build that succeeded
+    /// Where the bone ends in its node's space, as a file told it; zero where none did. The mesh's direction
+    /// is not always that: see TKBVHStream.
+    Vec3 m_kEnd = kVec3Zero;
 };
 
 /// A ball of radius 0.125 x length, for a bone that branches.

@@ -2,16 +2,25 @@
 
 #include "BoneMeshQueries.h"
 #include "CGeometry.h"
+#include "CKeyframeControl.h"
 #include "CLineWriter.h"
 #include "CMotionSampler.h"
 #include "Euler.h"
 #include "TKBVHFile.h"
 #include "TKBVHStream.h"
 
+#include <algorithm>
 #include <cmath>
 #include <iterator>
 
 namespace gw {
+
+/// What tells the two ways of writing apart.
+struct BVHWriteRules
+{
+    int frameCount;
+    bool exact;
+};
 
 namespace {
 
@@ -34,26 +43,36 @@ Vec3 EndOffset(CNode& node)
     return TransformCoord(kVec3UnitX, world) - node.m_kWorldMatrix.Translation();
 }
 
+// Whether a joint's positions are anything but its offset in every frame.
+bool MovesAgainstParent(const CNode& node)
+{
+    const CKeyframeControl* track = RecordCast<CKeyframeControl>(node.GetControl());
+    const Vec3 rest = track ? track->m_kRestMatrix.Translation() : kVec3Zero;
+    return track && std::ranges::any_of(track->m_kPositionKeys, [&](const Vec3& key) { return key != rest; });
+}
+
 // Takes a tree in rest pose. Bones are collected in the order of the rows.
-void CollectBones(CNode& node, TKBVHJoint& joint, const Vec3& parentPosition, std::vector<Bone>& bones)
+void CollectBones(CNode& node, TKBVHJoint& joint, const Vec3& parentPosition, bool exact,
+                  std::vector<Bone>& bones)
 {
     const Vec3 position = node.m_kWorldMatrix.Translation();
     joint.name = node.NameView();
-    joint.offset = position - parentPosition;
+    joint.offset =
+        exact && joint.kind == EJointKind::Joint ? node.m_kMatrix.Translation() : position - parentPosition;
     joint.channels = {5, 4, 3};
-    if (joint.kind == EJointKind::Root)
+    if (joint.kind == EJointKind::Root || (exact && MovesAgainstParent(node)))
         joint.channels.insert(joint.channels.begin(), {0, 1, 2});
     bones.push_back({&node, &joint});
     if (node.HasNoNodeChild())
     {
         TKBVHJoint& end = joint.AddChild(EJointKind::EndSite);
         end.name = "Site";
-        end.offset = EndOffset(node);
+        end.offset = exact ? NodeBoneEnd(node) : EndOffset(node);
     }
     for (size_t i = 0; i < node.GetChildCount(); ++i)
     {
         if (CNode* child = RecordCast<CNode>(node.ChildAt(i)))
-            CollectBones(*child, joint.AddChild(EJointKind::Joint), position, bones);
+            CollectBones(*child, joint.AddChild(EJointKind::Joint), position, exact, bones);
     }
 }
 
@@ -80,12 +99,13 @@ void WriteJoint(CLineWriter& out, const TKBVHJoint& joint, std::string& indent)
     out.Text(indent).Line("}");
 }
 
-void WriteRow(CLineWriter& out, const std::vector<Bone>& bones)
+void WriteRow(CLineWriter& out, const std::vector<Bone>& bones, bool exact)
 {
     for (const auto& [node, joint] : bones)
     {
         const Vec3 position = node->m_kMatrix.Translation() - joint->offset;
-        const Vec3 degrees = Mat3ToEulerDegrees(NormalizedRows(node->m_kMatrix));
+        const Mat3 rotation = NormalizedRows(node->m_kMatrix);
+        const Vec3 degrees = exact ? EulerDegreesZYX(rotation) : Mat3ToEulerDegrees(rotation);
         const float values[] = {position.x, position.y, position.z, degrees.x, degrees.y, degrees.z};
         for (const int channel : joint->channels)
             out.Number(values[channel]).Text(" ");
@@ -103,7 +123,17 @@ bool TKBVHStream::WriteFile(const std::string& path)
     const float lastFrame = GetLastFrame();
     if (!(std::fabs(lastFrame) <= kFrameLimit))
         return m_kRecord.Fail(EFailure::TooLarge);
-    const auto frameCount = static_cast<int>(lastFrame);
+    return WriteWith(path, {static_cast<int>(lastFrame), false});
+}
+
+bool TKBVHStream::WriteExact(const std::string& path)
+{
+    m_kRecord.Clear();
+    return motionRoot ? WriteWith(path, {GetKeyCount(), true}) : m_kRecord.Fail(EFailure::NoRoot);
+}
+
+bool TKBVHStream::WriteWith(const std::string& path, const BVHWriteRules& rules)
+{
     const float frequency = GetFrequency();
 
     SwitchControls(*motionRoot, false);
@@ -111,7 +141,7 @@ bool TKBVHStream::WriteFile(const std::string& path)
     TKBVHJoint root;
     root.kind = EJointKind::Root;
     std::vector<Bone> bones;
-    CollectBones(*motionRoot, root, kVec3Zero, bones);
+    CollectBones(*motionRoot, root, kVec3Zero, rules.exact, bones);
     SwitchControls(*motionRoot, true);
 
     CMotionSampler sampler(*motionRoot);
@@ -120,12 +150,13 @@ bool TKBVHStream::WriteFile(const std::string& path)
         out.Line("HIERARCHY");
         WriteJoint(out, root, indent);
         out.Line("MOTION");
-        out.Text("Frames: ").Int(frameCount).EndLine();
-        out.Text("Frame Time: ").Number(frequency).EndLine();
-        for (int frame = 0; frame < frameCount; ++frame)
+        out.Text("Frames: ").Int(rules.frameCount).EndLine();
+        out.Text("Frame Time: ");
+        (rules.exact ? out.Shortest(frequency) : out.Number(frequency)).EndLine();
+        for (int frame = 0; frame < rules.frameCount; ++frame)
         {
             sampler.PoseTree(TimeOfFrame(frame, frequency));
-            WriteRow(out, bones);
+            WriteRow(out, bones, rules.exact);
         }
         return true;
     });

@@ -53,6 +53,13 @@ CLineWriter& CLineWriter::Number(float value)
     return *this;
 }
 
+CLineWriter& CLineWriter::Shortest(float value)
+{
+    char* const begin = Room(kShortestBytes);
+    m_uiUsed += static_cast<size_t>(WriteShortest(begin, std::isfinite(value) ? value : 0.0f) - begin);
+    return *this;
+}
+
 void CLineWriter::EndLine()
 {
     Text(kLineEnd);

@@ -22,6 +22,8 @@ public:
     CLineWriter& Int(int32_t value);
     /// As "%f". What is no finite number is written as 0: no reader takes anything else back.
     CLineWriter& Number(float value);
+    /// In as many decimals as it takes to read the same number back.
+    CLineWriter& Shortest(float value);
     void EndLine();
     void Line(std::string_view text);
 

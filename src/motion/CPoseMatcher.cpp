@@ -99,6 +99,7 @@ Mat3 OffsetRotation(const Vec3& degrees, const Mat3& matrix)
 }
 
 CPoseMatcher::CPoseMatcher(const CRetargeter& retargeter, CNode& targetRoot)
+    : m_bPlainTurns(retargeter.HasPlainTurns())
 {
     for (CNode* node : NodesOf(targetRoot))
         m_kBones.push_back({node, IndexOf(node->GetParentNode()), NormalizedRows(node->m_kMatrix),
@@ -223,7 +224,7 @@ void CPoseMatcher::PoseLink(const Chain& chain, const Link& link, const Mat3& ro
         bone.translation = local.Translation();
 
     Mat3 m = NormalizedRows(local);
-    if (!link.whole || !IsFaithful(m, link.type))
+    if (!link.whole || !(m_bPlainTurns || IsFaithful(m, link.type)))
         m = SharedRotation(m, link.type, link.fraction, link.curve);
     if (link.turned)
         m = link.offset * m;

@@ -77,6 +77,7 @@ private:
     void PoseLink(const Chain& chain, const Link& link, const Mat3& rotation, const Vec3& scale,
                   Vec3& position);
 
+    bool m_bPlainTurns;
     std::vector<Bone> m_kBones;
     std::vector<Chain> m_kChains;
     std::vector<CNode*> m_kSources;

@@ -51,6 +51,11 @@ public:
     bool SetFixed(CNode* target, bool fixed);
     bool SetShares(CNode* target, const CBoneShares& shares);
 
+    /// Whether a bone that takes the whole of a rotation takes it as it is, also at whole quarter turns, where
+    /// the decomposition of its share gives another one back. Off by the rules; the tables do not change it.
+    void SetPlainTurns(bool plain) { m_bPlainTurns = plain; }
+    bool HasPlainTurns() const { return m_bPlainTurns; }
+
     // Lookups take null keys and absent ones, and insert nothing.
     CNode* SourceOf(const CNode* node) const;
     const Vec3& OffsetAngles(const CNode* node) const;
@@ -106,6 +111,7 @@ private:
     CNode* m_pkSourceRoot = nullptr;
     CNode* m_pkTargetRoot = nullptr;
     bool m_bFaithful = false;
+    bool m_bPlainTurns = false;
     CFailureRecord m_kRecord;
     std::function<void(size_t, size_t)> m_kProgress;
 };

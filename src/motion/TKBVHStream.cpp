@@ -24,9 +24,25 @@ float SignedBy(float sign, double angle)
     return static_cast<float>(sign < 0.0f ? -angle : angle);
 }
 
-// Turns +Y, the axis of a bone mesh, to where a child stands: about Z by the offset's direction in the XY
-// plane, about Y by that in the XZ plane.
-Mat3 TowardsChild(const Vec3& offset)
+float LongestOffset(const TKBVHJoint& joint)
+{
+    double longest = 0.0;
+    for (const auto& child : joint.children)
+        longest = std::max(longest, Vec3Length(child->offset));
+    return static_cast<float>(longest);
+}
+
+// The first end site below a joint, or zero.
+Vec3 EndOf(const TKBVHJoint& joint)
+{
+    const auto end =
+        std::ranges::find_if(joint.children, [](const auto& child) { return !child->MakesNode(); });
+    return end == joint.children.end() ? kVec3Zero : (*end)->offset;
+}
+
+} // namespace
+
+Mat3 BoneTurn(const Vec3& offset)
 {
     float aboutZ = 0.0f;
     float aboutY = 0.0f;
@@ -42,16 +58,6 @@ Mat3 TowardsChild(const Vec3& offset)
     const Mat3 b = Mat3FromAxisAngle(kVec3UnitZ, aboutZ) * Mat3FromAxisAngle(kVec3UnitY, -aboutY);
     return Mat3FromAxisAngle(kVec3UnitZ, -kHalfPi) * b;
 }
-
-float LongestOffset(const TKBVHJoint& joint)
-{
-    double longest = 0.0;
-    for (const auto& child : joint.children)
-        longest = std::max(longest, Vec3Length(child->offset));
-    return static_cast<float>(longest);
-}
-
-} // namespace
 
 bool TKBVHStream::Load(const std::string& path)
 {
@@ -167,8 +173,9 @@ void TKBVHStream::AddBoneShape(const TKBVHFile&, const TKBVHJoint& joint, CNode&
     if (joint.children.empty())
         return;
     CBoneMesh& mesh = AttachBone(node, joint.name, joint.children.size(), LongestOffset(joint));
+    mesh.m_kEnd = EndOf(joint);
     if (joint.children.size() == 1)
-        mesh.m_kMatrix = Mat4Compose(TowardsChild(joint.children[0]->offset), kVec3Zero);
+        mesh.m_kMatrix = Mat4Compose(BoneTurn(joint.children[0]->offset), kVec3Zero);
 }
 
 } // namespace gw

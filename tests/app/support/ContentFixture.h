@@ -49,7 +49,10 @@ public:
     void EndWaitCursor() override { --m_iWaits; }
     void PostCloseRequest() override { m_kCalls.emplace_back("close"); }
     void EnableChild(std::string_view child, bool on) override { m_kEnabled[std::string(child)] = on; }
-    void SetChildFace(std::string_view, int face) override { m_iPlayFace = face; }
+    void SetChildFace(std::string_view child, int face) override
+    {
+        m_iPlayFace = child == "play" ? face : m_iPlayFace;
+    }
     void SetChildButtonState(std::string_view, bool on) override { m_bButtonState = on; }
     bool GetChildButtonState(std::string_view) const override { return m_bButtonState; }
     void SetChildScrollValue(std::string_view, int value) override { m_iScrollValue = value; }

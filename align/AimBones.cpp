@@ -1,0 +1,156 @@
+#include "AimBones.h"
+
+#include "AlignMotion.h"
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CPoseSampler.h"
+#include "CRetargeter.h"
+#include "Skeleton.h"
+
+#include <unordered_map>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kCollars[] = {"LCollar", "RCollar"};
+constexpr const char* kHipBones[] = {"LPelvis", "RPelvis"};
+
+class CBoneAimer
+{
+public:
+    CBoneAimer(CRetargeter& table, CNode& targetRoot, const BodyMotion& source, const Alignment& alignment,
+               const AlignedMotion& aligned);
+    void Aim();
+
+private:
+    struct Row
+    {
+        CNode* target;
+        CNode* source; ///< of the motion that is not aligned; null for none
+        bool fixed;
+        Mat3 turn = kMat3Identity; ///< at rest, against the source's
+    };
+
+    Row* RowOf(const char* target);
+    bool LiesInTrunk(const CNode* source) const;
+    void TakeSpine();
+    void TakeCollars();
+    void TakePelvis();
+    void SetRow(const Row& row);
+
+    CRetargeter& m_kTable;
+    CNode& m_kTargetRoot;
+    const BodyMotion& m_kSource;
+    const AlignedMotion& m_kAligned;
+    std::vector<Row> m_kRows;
+    std::unordered_map<const CNode*, size_t> m_kIndex;
+    const Alignment& m_kAlignment;
+};
+
+CBoneAimer::CBoneAimer(CRetargeter& table, CNode& targetRoot, const BodyMotion& source,
+                       const Alignment& alignment, const AlignedMotion& aligned)
+    : m_kTable(table), m_kTargetRoot(targetRoot), m_kSource(source), m_kAligned(aligned),
+      m_kAlignment(alignment)
+{
+    for (CNode* target : NodesOf(targetRoot))
+    {
+        bool fixed = false;
+        table.IsFixed(target, fixed);
+        m_kRows.push_back({target, table.SourceOf(target), fixed, kMat3Identity});
+    }
+    for (const JointAlignment& joint : alignment.joints)
+        m_kIndex.emplace(joint.node, m_kIndex.size());
+}
+
+CBoneAimer::Row* CBoneAimer::RowOf(const char* target)
+{
+    const CNode* const node = FindNode(&m_kTargetRoot, target);
+    for (Row& row : m_kRows)
+    {
+        if (row.target == node)
+            return &row;
+    }
+    return nullptr;
+}
+
+bool CBoneAimer::LiesInTrunk(const CNode* source) const
+{
+    const auto found = m_kIndex.find(source);
+    return found != m_kIndex.end() && m_kAlignment.joints[found->second].axis == kVec3UnitY;
+}
+
+// A collar tells nothing of the torso's turn that its own does not spoil.
+void CBoneAimer::TakeSpine()
+{
+    const std::vector<CNode*>& spine = m_kSource.body.spine;
+    Row* const torso = RowOf("UpperTorso");
+    Row* const waist = RowOf("Waist");
+    if (!torso || !waist || !torso->source || LiesInTrunk(torso->source) || spine.empty())
+        return;
+    torso->source = spine.back();
+    waist->fixed = false;
+    waist->source = spine.size() > 1 ? spine[(spine.size() - 1) / 2] : nullptr;
+}
+
+// Left to itself a collar would share the upper arm's turn, from a frame that lies across its own.
+void CBoneAimer::TakeCollars()
+{
+    const Row* const torso = RowOf("UpperTorso");
+    for (const char* name : kCollars)
+    {
+        Row* const collar = RowOf(name);
+        if (collar && torso && !collar->source && !collar->fixed)
+            collar->source = torso->source;
+    }
+}
+
+// Legs hang on the pelvis, which need not lie as the bone from hip to spine does.
+void CBoneAimer::TakePelvis()
+{
+    for (const char* name : kHipBones)
+    {
+        Row* const bone = RowOf(name);
+        if (!bone || bone->source)
+            continue;
+        bone->fixed = false;
+        bone->source = m_kSource.body.hip;
+        bone->turn = m_kAlignment.pelvisTurn;
+    }
+}
+
+void CBoneAimer::SetRow(const Row& row)
+{
+    if (row.fixed)
+        m_kTable.SetFixed(row.target, true);
+    const auto found = m_kIndex.find(row.source);
+    if (found == m_kIndex.end())
+        return;
+    CNode* const source = m_kAligned.joints[found->second];
+    const CBoneMesh* const mesh = FindBoneMesh(*source);
+    const Mat3 frame = mesh ? NormalizedRows(mesh->m_kMatrix) : kMat3Identity;
+    m_kTable.SetSourceOf(row.target, source);
+    m_kTable.SetOffsetMatrix(row.target,
+                             NormalizedRows(RestWorld(*row.target)) * row.turn * Mat3Transpose(frame));
+}
+
+void CBoneAimer::Aim()
+{
+    TakeSpine();
+    TakeCollars();
+    TakePelvis();
+    m_kTable.SetScenes(m_kAligned.root.Get(), &m_kTargetRoot);
+    m_kTable.SetPlainTurns(true); // a T-pose is made of whole quarter turns
+    for (const Row& row : m_kRows)
+        SetRow(row);
+}
+
+} // namespace
+
+void AimBones(CRetargeter& table, CNode& targetRoot, const BodyMotion& source, const Alignment& alignment,
+              const AlignedMotion& aligned)
+{
+    CBoneAimer(table, targetRoot, source, alignment, aligned).Aim();
+}
+
+} // namespace gw

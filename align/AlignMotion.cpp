@@ -1,0 +1,143 @@
+// The new local pose of a joint follows from the old one without a look at the world: with A its own turn
+// and P its parent's, the rotation L becomes inverse(A) · L · P and the translation t becomes t · P. So a
+// bone's length stays exact however deep it hangs. Rotations alone make a BVH; where a file scales bones,
+// the scale goes into the translations of what is below.
+
+#include "AlignMotion.h"
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CKeyframeControl.h"
+#include "CMotionSampler.h"
+#include "MotionNode.h"
+#include "TKBVHStream.h"
+#include "Turns.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+// Part of a bone's length by which a position may differ from the rest pose's and be the same; and by which
+// one that repeats an offset does so in other digits.
+constexpr double kSamePosition = 1e-6;
+constexpr double kSameRepeated = 0.01;
+
+Vec3 Scaled(const Vec3& v, const Vec3& scale)
+{
+    return {v.x * scale.x, v.y * scale.y, v.z * scale.z};
+}
+
+size_t ChildJoints(const CNode& node)
+{
+    size_t count = 0;
+    for (size_t i = 0; i < node.GetChildCount(); ++i)
+        count += RecordCast<CNode>(node.ChildAt(i)) ? 1 : 0;
+    return count;
+}
+
+class CMotionAligner
+{
+public:
+    CMotionAligner(const BodyMotion& motion, const Alignment& alignment)
+        : m_kMotion(motion), m_kAlignment(alignment), m_kScales(alignment.joints.size(), kVec3One)
+    {
+    }
+    AlignedMotion Align();
+
+private:
+    const Mat3& ParentTurn(const JointAlignment& joint) const
+    {
+        return joint.parent < 0 ? m_kAlignment.worldTurn : Turns(joint.parent);
+    }
+    const Mat3& Turns(int joint) const { return m_kAlignment.joints[static_cast<size_t>(joint)].turn; }
+    void AddJoint(const JointAlignment& joint);
+    void AddBone(const JointAlignment& joint, CNode& node);
+    void AddKey(size_t index, int frame);
+
+    const BodyMotion& m_kMotion;
+    const Alignment& m_kAlignment;
+    AlignedMotion m_kResult;
+    std::vector<CKeyframeControl*> m_kTracks;
+    std::vector<Vec3> m_kScales; // of each joint in the world, at the frame
+};
+
+void CMotionAligner::AddJoint(const JointAlignment& joint)
+{
+    CNode* node = nullptr;
+    if (joint.parent < 0)
+        m_kResult.root = node = new CNode;
+    else
+        node = &AttachNode(*m_kResult.joints[static_cast<size_t>(joint.parent)]);
+    node->SetName(joint.node->GetName());
+    m_kResult.joints.push_back(node);
+    const Vec3 offset = Turned(joint.restOffset, ParentTurn(joint));
+    CKeyframeControl& track =
+        AttachTrack(*node, m_kMotion.frameCount, m_kMotion.frequency, Mat4Compose(kMat3Identity, offset));
+    track.m_kRotationKeys.reserve(track.m_kKeyTimes.size());
+    m_kTracks.push_back(&track);
+    AddBone(joint, *node);
+}
+
+void CMotionAligner::AddBone(const JointAlignment& joint, CNode& node)
+{
+    const CBoneMesh* const old = FindBoneMesh(*joint.node);
+    if (!old)
+        return;
+    const size_t children = ChildJoints(*joint.node);
+    const Vec3 end = Turned(NodeBoneEnd(*joint.node), joint.turn);
+    CBoneMesh& mesh = AttachBone(node, std::string(node.NameView()), children, old->m_fLength);
+    mesh.m_kEnd = children == 0 || old->m_kEnd != kVec3Zero ? end : kVec3Zero;
+    if (joint.axis != kVec3Zero)
+        mesh.m_kMatrix = Mat4Compose(BoneTurn(joint.axis), kVec3Zero);
+}
+
+void CMotionAligner::AddKey(size_t index, int frame)
+{
+    const JointAlignment& joint = m_kAlignment.joints[index];
+    const Mat4& local = joint.node->m_kMatrix;
+    CKeyframeControl& track = *m_kTracks[index];
+    track.m_kRotationKeys.push_back(
+        QuatFromMat3(Mat3Transpose(joint.turn) * NormalizedRows(local) * ParentTurn(joint)));
+
+    const Vec3 above = joint.parent < 0 ? kVec3One : m_kScales[static_cast<size_t>(joint.parent)];
+    m_kScales[index] = Scaled(above, RowLengths(local));
+    const Vec3 once = joint.tellOnce ? joint.restOffset : kVec3Zero;
+    const Vec3 position = Turned(Scaled(local.Translation() - once, above), ParentTurn(joint));
+    std::vector<Vec3>& keys = track.m_kPositionKeys;
+    const Vec3 still = keys.empty() ? track.m_kRestMatrix.Translation() : keys.front();
+    const double same = (joint.tellOnce ? kSameRepeated : kSamePosition) * Vec3Length(still);
+    const bool isStill = keys.size() <= 1 && Vec3Length(position - still) <= same;
+    if (isStill && !keys.empty())
+        return; // the last key stands in for those that are missing
+    if (keys.size() == 1 && frame > 1)
+        keys.assign(static_cast<size_t>(frame), Vec3(keys.front()));
+    keys.push_back(isStill ? still : position);
+}
+
+AlignedMotion CMotionAligner::Align()
+{
+    for (const JointAlignment& joint : m_kAlignment.joints)
+        AddJoint(joint);
+    CMotionSampler sampler(*m_kMotion.root);
+    for (int frame = 0; frame < m_kMotion.frameCount; ++frame)
+    {
+        sampler.PoseTree(TimeOfFrame(frame, m_kMotion.frequency));
+        for (size_t index = 0; index < m_kTracks.size(); ++index)
+            AddKey(index, frame);
+    }
+    m_kMotion.root->UpdateScene(0.0f, true);
+    m_kResult.root->UpdateScene(0.0f, true);
+    return std::move(m_kResult);
+}
+
+} // namespace
+
+AlignedMotion AlignMotion(const BodyMotion& motion, const Alignment& alignment)
+{
+    return CMotionAligner(motion, alignment).Align();
+}
+
+} // namespace gw

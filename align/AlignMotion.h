@@ -1,0 +1,22 @@
+#pragma once
+
+#include "Alignment.h"
+#include "CNode.h"
+
+#include <vector>
+
+namespace gw {
+
+/// A motion told from another rest pose.
+struct AlignedMotion
+{
+    Ref<CNode> root;
+    std::vector<CNode*> joints; ///< as those of the alignment, in its order
+};
+
+/// Tells a motion from the rest pose of its alignment, as a tree of its own: a track and a bone mesh for each
+/// joint, whose world positions are those of the source at every frame, turned so that Y is up. Bones of the
+/// body have the frames that the target's have at rest. Positions stand in a track only where they change.
+AlignedMotion AlignMotion(const BodyMotion& motion, const Alignment& alignment);
+
+} // namespace gw

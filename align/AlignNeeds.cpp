@@ -1,0 +1,69 @@
+#include "AlignNeeds.h"
+
+#include "Alignment.h"
+#include "BodyPose.h"
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CReferencePose.h"
+#include "CTreePoser.h"
+#include "TKBVHStream.h"
+#include "Turns.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr double kOffAxis = 30.0; // degrees that a limb may lie beside its axis, or its frame about it
+
+bool IsLimb(EBodyPart part)
+{
+    switch (part)
+    {
+    case EBodyPart::UpperArm:
+    case EBodyPart::Forearm:
+    case EBodyPart::Thigh:
+    case EBodyPart::Shin:
+        return true;
+    default:
+        return false;
+    }
+}
+
+// By how much the frame of a bone is turned about it against one that is only swung from an axis.
+double FrameTwist(const CNode& joint)
+{
+    CBoneMesh* const mesh = FindBoneMesh(joint);
+    if (!mesh || !RecordCast<CBoneShapeMesh>(mesh))
+        return 0.0;
+    const Mat3 frame = NormalizedRows(mesh->m_kMatrix);
+    const Vec3 direction = frame.Row(1);
+    const Vec3 axis = NearestAxis(direction);
+    return AngleOf(frame * Mat3Transpose(BoneTurn(axis) * LeastSwing(axis, direction)));
+}
+
+} // namespace
+
+std::vector<AlignFinding> FindRestNeeds(const CTreePoser& tree, const std::vector<JointRole>& roles,
+                                        double legLength)
+{
+    std::vector<AlignFinding> findings;
+    for (size_t i = 0; i < roles.size(); ++i)
+    {
+        const CNode& joint = *tree.Joints()[i];
+        const Vec3 way = WayTo(roles[i].next ? &joint : nullptr, roles[i].next);
+        if (!IsLimb(roles[i].part) || !(Vec3Length(way) > kApart * legLength))
+            continue;
+        const double off = AngleBetween(way, AxisOf(roles[i]));
+        if (off > kOffAxis)
+            findings.push_back({EAlignNeed::RestPose, std::string(joint.NameView()), off});
+        const double twist = FrameTwist(joint);
+        if (twist > kOffAxis)
+            findings.push_back({EAlignNeed::BoneFrames, std::string(joint.NameView()), twist});
+    }
+    return findings;
+}
+
+} // namespace gw

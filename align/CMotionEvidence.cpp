@@ -1,0 +1,123 @@
+#include "CMotionEvidence.h"
+
+#include "Alignment.h"
+#include "BodyPose.h"
+#include "CPoseSampler.h"
+#include "Turns.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr double kSampleSeconds = 1.0 / 30.0; // contacts are told by no finer steps
+
+int FrameStep(const BodyMotion& motion)
+{
+    if (!IsFrameTime(motion.frequency))
+        return 1;
+    const double step = std::floor(kSampleSeconds / static_cast<double>(motion.frequency) + 0.01);
+    return static_cast<int>(std::clamp(step, 1.0, std::max(1.0, motion.frameCount / 30.0)));
+}
+
+void WatchBody(const CBodyMap& body, CPoseSampler& sampler)
+{
+    for (CNode* joint : {body.hip, body.head, TrunkTop(body)})
+        sampler.Watch(joint);
+    for (const BodyArm& arm : body.arms)
+    {
+        for (CNode* joint : {arm.upperArm, arm.forearm, arm.hand})
+            sampler.Watch(joint);
+    }
+    for (const BodyLeg& leg : body.legs)
+    {
+        for (CNode* joint : {leg.thigh, leg.shin, leg.foot, leg.toe})
+            sampler.Watch(joint);
+    }
+}
+
+} // namespace
+
+CMotionEvidence::CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn,
+                                 std::span<const LooseWay> ways)
+{
+    for (const LooseWay& way : ways)
+        m_kWays.push_back({way, kVec3Zero});
+    auto hinge = m_kHinges.begin();
+    for (const EBodySide side : kBodySides)
+    {
+        const BodyArm& arm = motion.body.Arm(side);
+        const BodyLeg& leg = motion.body.Leg(side);
+        *hinge++ = {arm.upperArm, arm.forearm, arm.hand, {}, {}};
+        *hinge++ = {leg.thigh, leg.shin, leg.foot, {}, {}};
+    }
+    Walk(motion, worldTurn);
+}
+
+void CMotionEvidence::Walk(const BodyMotion& motion, const Mat3& worldTurn)
+{
+    CPoseSampler sampler(motion.frequency);
+    WatchBody(motion.body, sampler);
+    for (const Way& way : m_kWays)
+        sampler.Watch(way.joints.to);
+    CSoleMeter soles(motion.body, worldTurn);
+    const Vec3 up = Turned(kVec3UnitY, Mat3Transpose(worldTurn));
+    const int step = FrameStep(motion);
+    double leg = 0.0;
+    for (int frame = 0; frame < motion.frameCount; frame += step)
+    {
+        sampler.Pose(frame);
+        leg = frame == 0 ? LegLength(motion.body) : leg;
+        soles.Add();
+        JudgeFrame(motion.body, up, frame);
+    }
+    for (const EBodySide side : kBodySides)
+        m_kSoles[static_cast<size_t>(side)] =
+            soles.Normal(side, leg, static_cast<double>(motion.frequency) * step);
+}
+
+void CMotionEvidence::JudgeFrame(const CBodyMap& body, const Vec3& up, int frame)
+{
+    for (Hinge& hinge : m_kHinges)
+    {
+        if (!hinge.upper || !hinge.lower || !hinge.end)
+            continue;
+        const Vec3 upper = WayTo(hinge.upper, hinge.lower);
+        const Vec3 lower = WayTo(hinge.lower, hinge.end);
+        hinge.inUpper.Add(upper, lower, *hinge.upper);
+        hinge.inLower.Add(upper, lower, *hinge.lower);
+    }
+    for (auto& [joints, sum] : m_kWays)
+        sum = sum + LocalDirection(Vec3Normalized(WayTo(joints.from, joints.to)), *joints.from);
+    const double error = StanceError(body, up);
+    if (m_iReferenceFrame >= 0 && !(error < m_fReferenceError))
+        return;
+    m_iReferenceFrame = frame;
+    m_fReferenceError = error;
+}
+
+std::optional<Vec3> CMotionEvidence::MeanWay(const CNode& from) const
+{
+    for (const auto& [joints, sum] : m_kWays)
+    {
+        if (joints.from == &from && sum != kVec3Zero)
+            return Vec3Normalized(sum);
+    }
+    return std::nullopt;
+}
+
+std::optional<Vec3> CMotionEvidence::HingeAxis(const CNode& bone) const
+{
+    for (const Hinge& hinge : m_kHinges)
+    {
+        if (hinge.upper == &bone)
+            return hinge.inUpper.Axis();
+        if (hinge.lower == &bone)
+            return hinge.inLower.Axis();
+    }
+    return std::nullopt;
+}
+
+} // namespace gw

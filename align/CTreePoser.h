@@ -1,0 +1,31 @@
+#pragma once
+
+#include "CPoseSampler.h"
+
+#include <unordered_map>
+#include <vector>
+
+namespace gw {
+
+/// All joints of a motion, depth first, and their world matrices in its rest pose or at a frame. The tree
+/// must stay as it is meanwhile.
+class CTreePoser
+{
+public:
+    CTreePoser(CNode& root, float frequency);
+
+    const std::vector<CNode*>& Joints() const { return m_kJoints; }
+    /// The place of a joint in that list, or -1.
+    int IndexOf(const CNode* joint) const;
+    int ParentOf(size_t joint) const { return IndexOf(m_kJoints[joint]->GetParentNode()); }
+
+    void PoseRest();
+    void Pose(double frame) { m_kSampler.Pose(frame); }
+
+private:
+    std::vector<CNode*> m_kJoints;
+    std::unordered_map<const CNode*, int> m_kIndex;
+    CPoseSampler m_kSampler;
+};
+
+} // namespace gw

@@ -1,0 +1,72 @@
+// Joint positions in a BVH are added to the offset. Many writers put the whole place into them, so that it
+// stands twice in the keys.
+
+#include "DoubledOffsets.h"
+
+#include "Alignment.h"
+#include "CTreePoser.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+constexpr int kDoubledSamples = 32;
+constexpr double kRepeats = 0.01; // of an offset: positions that are as near to it say it again
+// Where a file's positions are whole ones, those of joints that move stand around the offset.
+constexpr double kAround = 0.5;
+
+// What the keys of a joint say of its offset, frame by frame.
+class CDoubledMeter
+{
+public:
+    explicit CDoubledMeter(const Vec3& offset) : m_kOffset(offset) {}
+
+    void Add(const Vec3& position)
+    {
+        m_fLargest = std::max(m_fLargest, Vec3Length(position - m_kOffset * 2.0f));
+        m_kSum = m_kSum + (position - m_kOffset);
+        ++m_iFrames;
+    }
+    bool HasOffset() const { return m_kOffset != kVec3Zero && m_iFrames > 0; }
+    bool Repeats() const { return HasOffset() && m_fLargest <= kRepeats * Vec3Length(m_kOffset); }
+    bool StandsAround() const
+    {
+        const Vec3 mean = m_kSum * (1.0f / static_cast<float>(std::max(m_iFrames, 1)));
+        return HasOffset() && Vec3Length(mean - m_kOffset) <= kAround * Vec3Length(m_kOffset);
+    }
+
+private:
+    Vec3 m_kOffset;
+    Vec3 m_kSum = kVec3Zero;
+    double m_fLargest = 0.0;
+    int m_iFrames = 0;
+};
+
+} // namespace
+
+std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
+{
+    const auto& joints = tree.Joints();
+    std::vector<CDoubledMeter> meters;
+    for (const CNode* joint : joints)
+        meters.emplace_back(joint == motion.root ? kVec3Zero : RestLocal(*joint).Translation());
+    const int count = std::min(motion.frameCount, kDoubledSamples);
+    for (int i = 0; i < count; ++i)
+    {
+        tree.Pose(static_cast<int>(static_cast<int64_t>(motion.frameCount) * i / count));
+        for (size_t joint = 0; joint < joints.size(); ++joint)
+            meters[joint].Add(joints[joint]->m_kMatrix.Translation());
+    }
+    const auto repeating = std::ranges::count_if(meters, &CDoubledMeter::Repeats);
+    const auto around = std::ranges::count_if(meters, &CDoubledMeter::StandsAround);
+    // In a file whose positions are whole ones nearly all joints repeat; some of the rest move.
+    const bool areWhole = repeating * 2 >= around && repeating > 0;
+    std::vector<bool> doubled;
+    for (const CDoubledMeter& meter : meters)
+        doubled.push_back(meter.Repeats() || (areWhole && meter.StandsAround()));
+    return doubled;
+}
+
+} // namespace gw

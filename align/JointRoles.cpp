@@ -1,0 +1,181 @@
+#include "JointRoles.h"
+
+#include "CTreePoser.h"
+
+#include <span>
+
+namespace gw {
+
+namespace {
+
+struct Stop
+{
+    CNode* joint;
+    EBodyPart part;
+};
+
+class CRoleFinder
+{
+public:
+    CRoleFinder(const CTreePoser& tree, const CBodyMap& body)
+        : m_kTree(tree), m_kBody(body), m_kRoles(tree.Joints().size())
+    {
+    }
+    std::vector<JointRole> Find();
+
+private:
+    JointRole* RoleOf(const CNode* joint)
+    {
+        const int index = m_kTree.IndexOf(joint);
+        return index < 0 ? nullptr : &m_kRoles[static_cast<size_t>(index)];
+    }
+    void AddChain(std::span<const Stop> chain, EBodySide side);
+    void AddTrunk();
+    void AddLimbs(EBodySide side);
+    void FillShoulder(EBodySide side);
+    CNode* TrunkAbove(const CNode* joint);
+
+    const CTreePoser& m_kTree;
+    const CBodyMap& m_kBody;
+    std::vector<JointRole> m_kRoles;
+};
+
+bool IsUnder(const CNode* joint, const CNode* ancestor)
+{
+    while (joint && joint != ancestor)
+        joint = joint->GetParentNode();
+    return joint != nullptr;
+}
+
+// Joints that are missing are passed over.
+void CRoleFinder::AddChain(std::span<const Stop> chain, EBodySide side)
+{
+    std::vector<Stop> stops;
+    for (const Stop& stop : chain)
+    {
+        if (RoleOf(stop.joint))
+            stops.push_back(stop);
+    }
+    for (size_t i = 0; i < stops.size(); ++i)
+    {
+        const auto& [joint, part] = stops[i];
+        CNode* next = i + 1 < stops.size() ? stops[i + 1].joint : nullptr;
+        next = IsUnder(next, joint) && next != joint ? next : nullptr;
+        const EBodyPart between = part == EBodyPart::Hip ? EBodyPart::Spine : part;
+        while (next && next->GetParentNode() != joint)
+        {
+            CNode* const inner = next->GetParentNode();
+            *RoleOf(inner) = {between, side, next, false};
+            next = inner;
+        }
+        *RoleOf(joint) = {part, side, next, false};
+    }
+}
+
+void CRoleFinder::AddTrunk()
+{
+    std::vector<Stop> stops{
+        {m_kBody.hip, EBodyPart::Hip}
+    };
+    for (CNode* joint : m_kBody.spine)
+        stops.push_back({joint, EBodyPart::Spine});
+    for (CNode* joint : m_kBody.neck)
+        stops.push_back({joint, EBodyPart::Neck});
+    stops.push_back({m_kBody.head, EBodyPart::Head});
+    AddChain(stops, EBodySide::Left);
+    for (const CNode* joint = m_kBody.hip->GetParentNode(); RoleOf(joint); joint = joint->GetParentNode())
+        *RoleOf(joint) = {EBodyPart::AboveHip, EBodySide::Left, m_kBody.hip, false};
+}
+
+CNode* CRoleFinder::TrunkAbove(const CNode* joint)
+{
+    CNode* above = joint ? joint->GetParentNode() : nullptr;
+    while (above && RoleOf(above) && !IsTrunk(RoleOf(above)->part))
+        above = above->GetParentNode();
+    return above && RoleOf(above) ? above : nullptr;
+}
+
+void CRoleFinder::AddLimbs(EBodySide side)
+{
+    const BodyArm& arm = m_kBody.Arm(side);
+    const BodyLeg& leg = m_kBody.Leg(side);
+    const Stop armStops[] = {
+        {arm.clavicle, EBodyPart::Clavicle},
+        {arm.upperArm, EBodyPart::UpperArm},
+        {arm.forearm,  EBodyPart::Forearm },
+        {arm.hand,     EBodyPart::Hand    }
+    };
+    const Stop legStops[] = {
+        {leg.thigh, EBodyPart::Thigh},
+        {leg.shin,  EBodyPart::Shin },
+        {leg.foot,  EBodyPart::Foot },
+        {leg.toe,   EBodyPart::Toe  }
+    };
+    AddChain(armStops, side);
+    AddChain(legStops, side);
+    FillShoulder(side);
+}
+
+// What stands between the trunk and an upper arm is a clavicle where the body names none.
+void CRoleFinder::FillShoulder(EBodySide side)
+{
+    const BodyArm& arm = m_kBody.Arm(side);
+    CNode* const trunk = TrunkAbove(arm.upperArm);
+    if (!trunk)
+        return;
+    if (side == EBodySide::Left)
+        RoleOf(trunk)->carriesArms = true;
+    CNode* next = arm.upperArm;
+    for (CNode* joint = next->GetParentNode(); joint != trunk && !arm.clavicle;
+         joint = joint->GetParentNode())
+    {
+        *RoleOf(joint) = {EBodyPart::Clavicle, side, next, false};
+        next = joint;
+    }
+}
+
+std::vector<JointRole> CRoleFinder::Find()
+{
+    AddTrunk();
+    for (const EBodySide side : kBodySides)
+        AddLimbs(side);
+    return std::move(m_kRoles);
+}
+
+} // namespace
+
+std::vector<JointRole> FindRoles(const CTreePoser& tree, const CBodyMap& body)
+{
+    return CRoleFinder(tree, body).Find();
+}
+
+bool IsTrunk(EBodyPart part)
+{
+    return part == EBodyPart::Hip || part == EBodyPart::Spine || part == EBodyPart::Neck;
+}
+
+Vec3 AxisOf(const JointRole& role)
+{
+    switch (role.part)
+    {
+    case EBodyPart::Hip:
+    case EBodyPart::Spine:
+    case EBodyPart::Neck:
+    case EBodyPart::Head:
+        return kVec3UnitY;
+    case EBodyPart::Clavicle:
+    case EBodyPart::UpperArm:
+    case EBodyPart::Forearm:
+    case EBodyPart::Hand:
+        return role.side == EBodySide::Left ? kVec3UnitX : -kVec3UnitX;
+    case EBodyPart::Thigh:
+    case EBodyPart::Shin:
+    case EBodyPart::Foot:
+    case EBodyPart::Toe:
+        return -kVec3UnitY;
+    default:
+        return kVec3Zero;
+    }
+}
+
+} // namespace gw

@@ -1,0 +1,197 @@
+// A joint's new axes come from one pose in which every bone's direction in the canonical stance is known. A
+// bone is swung there by the least angle, from the alignment of what bears it, so that what a pose says of
+// the twist about the bone is kept: an arm that hangs, palm at the thigh, becomes one that stretches
+// sideways, palm down. Where knees and elbows bend enough to show their axes, these say more of the twist
+// than any rest pose, and overrule one that is far off.
+
+#include "JointTurns.h"
+
+#include "BodyPose.h"
+#include "CMotionEvidence.h"
+#include "CReferencePose.h"
+#include "CTreePoser.h"
+#include "FootTurn.h"
+#include "HandTurn.h"
+#include "Turns.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr double kApartOfHip = 0.04; // what a hip's shorter way to the spine says is not about the pelvis
+// Degrees by which a hip's way to the spine may lean and be that along which the pelvis lies; one to a joint
+// at the small of the back leads backward, and the way to a joint farther up has to lean less.
+constexpr double kHipLean = 40.0;
+constexpr double kChordLean = 20.0;
+// Degrees by which a hinge's axis may differ from the pose's before it is believed: less is how people stand
+// and how joints are placed.
+constexpr double kTwistLimit = 30.0;
+
+class CTurnFinder
+{
+public:
+    CTurnFinder(const CTreePoser& tree, const std::vector<JointRole>& roles, const CBodyMap& body,
+                const CReferencePose& pose, const CMotionEvidence& evidence, bool isRest)
+        : m_kTree(tree), m_kRoles(roles), m_kBody(body), m_kPose(pose), m_kEvidence(evidence),
+          m_bIsRest(isRest), m_kSwings(roles.size()), m_kTurns(roles.size())
+    {
+    }
+    std::vector<Mat3> Find();
+
+private:
+    Mat3 WorldTurn(size_t joint) const { return NormalizedRows(m_kTree.Joints()[joint]->m_kWorldMatrix); }
+    Vec3 WayOn(const CNode& from, const CNode* next, double apart) const;
+    Vec3 HipWay(size_t joint) const;
+    Mat3 StartOf(size_t joint) const;
+    Mat3 SwingOf(size_t joint) const;
+    Mat3 TrunkSwing(size_t joint) const;
+    Mat3 LimbSwing(size_t joint) const;
+    Mat3 HingeTwist(size_t joint, const Mat3& swing) const;
+    void Set(size_t joint);
+
+    const CTreePoser& m_kTree;
+    const std::vector<JointRole>& m_kRoles;
+    const CBodyMap& m_kBody;
+    const CReferencePose& m_kPose;
+    const CMotionEvidence& m_kEvidence;
+    bool m_bIsRest;
+    std::vector<Mat3> m_kSwings; // from the pose's world to the canonical one
+    std::vector<Mat3> m_kTurns;
+};
+
+// The way to the next joint of the body that lies apart; zero where there is none.
+Vec3 CTurnFinder::WayOn(const CNode& from, const CNode* next, double apart) const
+{
+    if (const std::optional<Vec3> loose = m_kEvidence.MeanWay(from))
+        return Turned(*loose, NormalizedRows(from.m_kWorldMatrix));
+    while (next && Vec3Length(WayTo(&from, next)) <= apart * m_kPose.legLength)
+        next = m_kRoles[static_cast<size_t>(m_kTree.IndexOf(next))].next;
+    return WayTo(next ? &from : nullptr, next);
+}
+
+// Up the spine, as far as it takes to lean less.
+Vec3 CTurnFinder::HipWay(size_t joint) const
+{
+    const CNode& hip = *m_kTree.Joints()[joint];
+    for (const CNode* next = m_kRoles[joint].next; next;
+         next = m_kRoles[static_cast<size_t>(m_kTree.IndexOf(next))].next)
+    {
+        const Vec3 way = WayOn(hip, next, kApartOfHip);
+        const double limit = next == m_kRoles[joint].next ? kHipLean : kChordLean;
+        if (way != kVec3Zero && AngleBetween(way, m_kPose.up) < limit)
+            return way;
+    }
+    return m_kPose.up;
+}
+
+Mat3 CTurnFinder::TrunkSwing(size_t joint) const
+{
+    const JointRole& role = m_kRoles[joint];
+    if (role.part == EBodyPart::Hip)
+        return TurnUpright(HipWay(joint), HipLine(m_kBody));
+    const Vec3 way = WayOn(*m_kTree.Joints()[joint], role.next, kApart);
+    if (role.carriesArms && way != kVec3Zero && ShoulderLine(m_kBody) != kVec3Zero)
+        return TurnUpright(way, ShoulderLine(m_kBody));
+    const Mat3& start = role.part == EBodyPart::Neck ? m_kPose.trunk : m_kPose.hips;
+    return start * LeastSwing(Turned(way, start), kVec3UnitY);
+}
+
+// What a limb's bone is swung from: the bone above where that is of the same limb, else the trunk. Upper
+// arms do not take the clavicle's swing over, which goes up where theirs goes down.
+Mat3 CTurnFinder::StartOf(size_t joint) const
+{
+    const EBodyPart part = m_kRoles[joint].part;
+    const int parent = m_kTree.ParentOf(joint);
+    const EBodyPart above = parent < 0 ? EBodyPart::None : m_kRoles[static_cast<size_t>(parent)].part;
+    const bool isRoot =
+        part == EBodyPart::Clavicle || part == EBodyPart::UpperArm || part == EBodyPart::Thigh;
+    if (above != EBodyPart::None && (above == part || !isRoot))
+        return m_kSwings[static_cast<size_t>(parent)];
+    return part == EBodyPart::Thigh ? m_kPose.hips : m_kPose.trunk;
+}
+
+// The turn about the bone that brings a hinge's axis where it belongs: left and right knees bend about +X,
+// a left elbow about -Y and a right one about +Y.
+Mat3 CTurnFinder::HingeTwist(size_t joint, const Mat3& swing) const
+{
+    const JointRole& role = m_kRoles[joint];
+    const std::optional<Vec3> axis = m_kEvidence.HingeAxis(*m_kTree.Joints()[joint]);
+    if (!axis)
+        return kMat3Identity;
+    const bool isLeg = role.part == EBodyPart::Thigh || role.part == EBodyPart::Shin;
+    const Vec3 elbow = role.side == EBodySide::Left ? -kVec3UnitY : kVec3UnitY;
+    const Vec3 bone = AxisOf(role);
+    const double twist =
+        TwistBetween(Turned(*axis, WorldTurn(joint) * swing), isLeg ? kVec3UnitX : elbow, bone);
+    return std::fabs(twist) > kTwistLimit ? TurnAbout(bone, twist) : kMat3Identity;
+}
+
+Mat3 CTurnFinder::LimbSwing(size_t joint) const
+{
+    const JointRole& role = m_kRoles[joint];
+    const Mat3 start = StartOf(joint);
+    const Vec3 way = WayOn(*m_kTree.Joints()[joint], role.next, kApart);
+    const Mat3 swing = start * LeastSwing(Turned(way, start), way == kVec3Zero ? kVec3Zero : AxisOf(role));
+    return swing * HingeTwist(joint, swing);
+}
+
+Mat3 CTurnFinder::SwingOf(size_t joint) const
+{
+    switch (m_kRoles[joint].part)
+    {
+    case EBodyPart::Hip:
+    case EBodyPart::Spine:
+    case EBodyPart::Neck:
+        return TrunkSwing(joint);
+    case EBodyPart::Head:
+        return m_kPose.trunk; // a head that is level and looks ahead, however its neck leans
+    case EBodyPart::Hand:
+        return HandTurn(*m_kTree.Joints()[joint], m_kRoles[joint].side, m_kPose, StartOf(joint));
+    case EBodyPart::Clavicle:
+    case EBodyPart::UpperArm:
+    case EBodyPart::Forearm:
+    case EBodyPart::Thigh:
+    case EBodyPart::Shin:
+        return LimbSwing(joint);
+    default:
+        return m_kPose.hips;
+    }
+}
+
+void CTurnFinder::Set(size_t joint)
+{
+    const JointRole& role = m_kRoles[joint];
+    const int parent = m_kTree.ParentOf(joint);
+    const bool isForefoot = role.part == EBodyPart::Foot || role.part == EBodyPart::Toe;
+    Mat3& turn = m_kTurns[joint];
+    if (m_kTree.Joints()[joint] == m_kBody.Leg(role.side).foot)
+        turn = FootTurn(m_kBody.Leg(role.side), m_kPose, m_kEvidence.SoleNormal(role.side), m_bIsRest);
+    else if (isForefoot && parent >= 0) // lies on the floor as the ankle's bone does
+        turn = WorldTurn(joint) * Mat3Transpose(WorldTurn(static_cast<size_t>(parent))) *
+               m_kTurns[static_cast<size_t>(parent)];
+    else if (role.part == EBodyPart::None && parent >= 0)
+        turn = NormalizedRows(RestLocal(*m_kTree.Joints()[joint])) * m_kTurns[static_cast<size_t>(parent)];
+    else
+        turn = WorldTurn(joint) * SwingOf(joint);
+    m_kSwings[joint] = Mat3Transpose(WorldTurn(joint)) * turn;
+}
+
+std::vector<Mat3> CTurnFinder::Find()
+{
+    for (size_t joint = 0; joint < m_kRoles.size(); ++joint)
+        Set(joint);
+    return std::move(m_kTurns);
+}
+
+} // namespace
+
+std::vector<Mat3> FindJointTurns(const CTreePoser& tree, const std::vector<JointRole>& roles,
+                                 const CBodyMap& body, const CReferencePose& pose,
+                                 const CMotionEvidence& evidence, bool isRest)
+{
+    return CTurnFinder(tree, roles, body, pose, evidence, isRest).Find();
+}
+
+} // namespace gw

@@ -1,0 +1,168 @@
+#include "AlignNeeds.h"
+#include "Alignment.h"
+#include "BodyPose.h"
+#include "CMotionEvidence.h"
+#include "CReferencePose.h"
+#include "CTreePoser.h"
+#include "DoubledOffsets.h"
+#include "JointTurns.h"
+#include "Turns.h"
+#include "WorldUp.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+bool HasBody(const BodyMotion& motion)
+{
+    return motion.root && motion.body.hip && TrunkTop(motion.body) &&
+           motion.body.Leg(EBodySide::Left).thigh && motion.body.Leg(EBodySide::Right).thigh;
+}
+
+std::string AxisName(const Vec3& axis)
+{
+    const bool minus = axis.x + axis.y + axis.z < 0.0f;
+    return std::string(minus ? "-" : "") + (axis.x != 0.0f ? "X" : axis.y != 0.0f ? "Y" : "Z");
+}
+
+void ReportUp(const Vec3& up, AlignReport& report)
+{
+    if (up != kVec3UnitY)
+        report.findings.push_back({EAlignNeed::UpAxis, AxisName(up), AngleBetween(up, kVec3UnitY)});
+}
+
+void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& doubled, AlignReport& report)
+{
+    for (size_t i = 0; i < joints.size(); ++i)
+    {
+        if (doubled[i])
+            report.findings.push_back({EAlignNeed::DoubledPositions, std::string(joints[i]->NameView())});
+    }
+}
+
+// Joints of the trunk that stand where the next one stands: they turn nothing but what is above that.
+std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<JointRole>& roles, double leg)
+{
+    const auto isApart = [leg](const CNode* a, const CNode* b) {
+        return Vec3Length(WayTo(a, b)) > kApart * leg;
+    };
+    std::vector<LooseWay> ways;
+    for (size_t i = 0; i < roles.size(); ++i)
+    {
+        CNode* const from = tree.Joints()[i];
+        CNode* to = roles[i].next;
+        if (!IsTrunk(roles[i].part) || !to || isApart(from, to))
+            continue;
+        while (to && !isApart(from, to))
+            to = roles[static_cast<size_t>(tree.IndexOf(to))].next;
+        if (to)
+            ways.push_back({from, to});
+    }
+    return ways;
+}
+
+bool IsFinite(const std::vector<Mat3>& turns)
+{
+    for (const Mat3& turn : turns)
+    {
+        for (const float element : turn.m)
+        {
+            if (!std::isfinite(element))
+                return false;
+        }
+    }
+    return true;
+}
+
+// One planning of one motion, step by step.
+class CAlignmentPlanner
+{
+public:
+    CAlignmentPlanner(const BodyMotion& motion, Alignment& alignment)
+        : m_kMotion(motion), m_kAlignment(alignment), m_kTree(*motion.root, motion.frequency),
+          m_kRoles(FindRoles(m_kTree, motion.body))
+    {
+    }
+    bool Plan();
+
+private:
+    void LookAtRest();
+    void FindUp();
+    void PoseReference(const CMotionEvidence& evidence);
+    void FillJoints(const std::vector<Mat3>& turns, const CReferencePose& pose);
+
+    const BodyMotion& m_kMotion;
+    Alignment& m_kAlignment;
+    CTreePoser m_kTree;
+    std::vector<JointRole> m_kRoles;
+    std::vector<LooseWay> m_kWays;
+    std::vector<bool> m_kDoubled;
+    bool m_bIsRest = false;  // the zero pose tells how bones are turned
+    Vec3 m_kUp = kVec3UnitY; // of the pose that does
+};
+
+void CAlignmentPlanner::LookAtRest()
+{
+    m_kTree.PoseRest();
+    const double leg = LegLength(m_kMotion.body);
+    m_kAlignment.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
+    m_kWays = FindLooseWays(m_kTree, m_kRoles, leg);
+    m_bIsRest = FindStance(m_kMotion.body, m_kUp) || m_kMotion.frameCount <= 0;
+}
+
+void CAlignmentPlanner::FindUp()
+{
+    const Vec3 worldUp = FindWorldUp(m_kMotion, m_bIsRest ? std::optional(m_kUp) : std::nullopt);
+    m_kUp = m_bIsRest ? m_kUp : worldUp;
+    m_kAlignment.worldTurn = LeastSwing(worldUp, kVec3UnitY);
+    ReportUp(worldUp, m_kAlignment.report);
+}
+
+void CAlignmentPlanner::PoseReference(const CMotionEvidence& evidence)
+{
+    if (m_bIsRest)
+        m_kTree.PoseRest();
+    else
+        m_kTree.Pose(m_kAlignment.report.referenceFrame = evidence.ReferenceFrame());
+}
+
+void CAlignmentPlanner::FillJoints(const std::vector<Mat3>& turns, const CReferencePose& pose)
+{
+    const auto hip = static_cast<size_t>(m_kTree.IndexOf(m_kMotion.body.hip));
+    const Mat3 pelvis = NormalizedRows(m_kMotion.body.hip->m_kWorldMatrix) * pose.hips;
+    m_kAlignment.pelvisTurn = Mat3Transpose(pelvis) * turns[hip];
+    for (size_t i = 0; i < turns.size(); ++i)
+    {
+        CNode* const joint = m_kTree.Joints()[i];
+        m_kAlignment.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], RestLocal(*joint).Translation(),
+                                       AxisOf(m_kRoles[i]), m_kDoubled[i]});
+    }
+}
+
+bool CAlignmentPlanner::Plan()
+{
+    LookAtRest();
+    FindUp();
+    m_kDoubled = FindDoubled(m_kTree, m_kMotion);
+    ReportDoubled(m_kTree.Joints(), m_kDoubled, m_kAlignment.report);
+    const CMotionEvidence evidence(m_kMotion, m_kAlignment.worldTurn, m_kWays);
+    PoseReference(evidence);
+    const CReferencePose pose(m_kMotion.body, m_kUp);
+    const std::vector<Mat3> turns =
+        FindJointTurns(m_kTree, m_kRoles, m_kMotion.body, pose, evidence, m_bIsRest);
+    FillJoints(turns, pose);
+    m_kMotion.root->UpdateScene(0.0f, true);
+    return IsFinite(turns);
+}
+
+} // namespace
+
+bool PlanAlignment(const BodyMotion& motion, Alignment& alignment)
+{
+    alignment = {};
+    return HasBody(motion) && CAlignmentPlanner(motion, alignment).Plan();
+}
+
+} // namespace gw

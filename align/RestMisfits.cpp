@@ -1,0 +1,64 @@
+#include "RestMisfits.h"
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CPoseMatcher.h"
+#include "CPoseSampler.h"
+#include "CRetargeter.h"
+#include "Skeleton.h"
+#include "Turns.h"
+
+namespace gw {
+
+namespace {
+
+constexpr double kMisfit = 40.0; // degrees: an A-pose's legs and bent knees are less, a wrong frame is 90
+
+struct BoneRow
+{
+    const char* name;
+    bool planted; ///< planting lays it along the source's, so that the turn about it is all that counts
+};
+constexpr BoneRow kBones[] = {
+    {"UpperTorso", false},
+    {"Neck",       false},
+    {"LUpperArm",  false},
+    {"LForearm",   false},
+    {"RUpperArm",  false},
+    {"RForearm",   false},
+    {"LThigh",     true },
+    {"LCalf",      true },
+    {"RThigh",     true },
+    {"RCalf",      true },
+};
+
+Mat3 RestBone(const CNode& source)
+{
+    const CBoneMesh* const mesh = FindBoneMesh(source);
+    const Mat4 world = RestWorld(source);
+    return NormalizedRows(mesh ? mesh->m_kMatrix * world : world);
+}
+
+} // namespace
+
+std::vector<RestMisfit> FindRestMisfits(const CRetargeter& table, CNode& targetRoot)
+{
+    std::vector<RestMisfit> misfits;
+    for (const auto& [name, planted] : kBones)
+    {
+        const CNode* const target = FindNode(&targetRoot, name);
+        const CNode* const source = table.SourceOf(target);
+        if (!target || !source)
+            continue;
+        const Mat3 offset = OffsetRotation(table.OffsetAngles(target), table.OffsetMatrix(target));
+        const Mat3 rest = NormalizedRows(RestWorld(*target));
+        const Mat3 turned = offset * RestBone(*source);
+        const Mat3 swing = planted ? LeastSwing(turned.Row(1), rest.Row(1)) : kMat3Identity;
+        const double degrees = AngleOf(turned * swing * Mat3Transpose(rest));
+        if (degrees > kMisfit)
+            misfits.push_back({name, std::string(source->NameView()), degrees});
+    }
+    return misfits;
+}
+
+} // namespace gw

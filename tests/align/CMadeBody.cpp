@@ -1,0 +1,185 @@
+#include "CMadeBody.h"
+
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
+#include "CKeyframeControl.h"
+#include "CPoseSampler.h"
+#include "MotionNode.h"
+#include "Skeleton.h"
+#include "TKBVHStream.h"
+#include "Turns.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+constexpr float kFrequency = 1.0f / 30.0f;
+
+struct JointRow
+{
+    const char* name;
+    const char* parent;
+    Vec3 offset;
+};
+
+constexpr JointRow kJoints[] = {
+    {"LowerTorso", "",           {0, 90, 0} },
+    {"Waist",      "LowerTorso", {0, 10, 0} },
+    {"UpperTorso", "Waist",      {0, 15, 0} },
+    {"Neck",       "UpperTorso", {0, 25, 0} },
+    {"Head",       "Neck",       {0, 10, 0} },
+    {"LCollar",    "UpperTorso", {3, 20, 0} },
+    {"LUpperArm",  "LCollar",    {14, 0, 0} },
+    {"LForearm",   "LUpperArm",  {28, 0, 0} },
+    {"LHand",      "LForearm",   {25, 0, 0} },
+    {"LThumb",     "LHand",      {3, -1, 4} },
+    {"LIndex",     "LHand",      {9, 0, 3}  },
+    {"LMiddle",    "LHand",      {9, 0, 0}  },
+    {"LLittle",    "LHand",      {9, 0, -3} },
+    {"RCollar",    "UpperTorso", {-3, 20, 0}},
+    {"RUpperArm",  "RCollar",    {-14, 0, 0}},
+    {"RForearm",   "RUpperArm",  {-28, 0, 0}},
+    {"RHand",      "RForearm",   {-25, 0, 0}},
+    {"LThigh",     "LowerTorso", {9, -5, 0} },
+    {"LCalf",      "LThigh",     {0, -40, 0}},
+    {"LFoot",      "LCalf",      {0, -38, 0}},
+    {"LToe",       "LFoot",      {0, -6, 13}},
+    {"RThigh",     "LowerTorso", {-9, -5, 0}},
+    {"RCalf",      "RThigh",     {0, -40, 0}},
+    {"RFoot",      "RCalf",      {0, -38, 0}},
+    {"RToe",       "RFoot",      {0, -6, 13}},
+};
+constexpr Vec3 kHandEnd{-9, 0, 0};
+constexpr double kLeg = 78.0;
+
+// A joint's rotation in the squat at a frame. Feet keep level while hips go down and arms go up.
+Mat3 Pose(const std::string& joint, int frame)
+{
+    const double phase = std::sin(0.16 * frame);
+    const double squat = 4.0 + 40.0 * phase * phase;
+    const double arms = 5.0 + 70.0 * phase * phase; // below the T-pose
+    const double side = joint.starts_with('L') ? 1.0 : -1.0;
+    const std::string part = joint.substr(1);
+    if (part == "Thigh")
+        return TurnAbout(kVec3UnitX, -squat);
+    if (part == "Calf")
+        return TurnAbout(kVec3UnitX, 2.0 * squat);
+    if (part == "Foot")
+        return TurnAbout(kVec3UnitX, -squat);
+    if (part == "UpperArm")
+        return TurnAbout(kVec3UnitZ, -side * arms);
+    if (part == "Forearm")
+        return TurnAbout(kVec3UnitY, -side * 1.5 * squat);
+    if (joint == "Head")
+        return TurnAbout(kVec3UnitY, 20.0 * phase);
+    return kMat3Identity;
+}
+
+Vec3 RootPlace(int frame)
+{
+    const double phase = std::sin(0.16 * frame);
+    const double squat = (4.0 + 40.0 * phase * phase) / 180.0 * std::acos(-1.0);
+    return {20.0f, static_cast<float>(90.0 - kLeg * (1.0 - std::cos(squat))), -30.0f};
+}
+
+} // namespace
+
+CMadeBody::CMadeBody(const Telling& telling) : m_iFrames(telling.frameCount)
+{
+    for (const auto& [name, parent, offset] : kJoints)
+    {
+        const bool orphan = *parent && !m_kJoints.contains(parent);
+        if (!orphan && std::ranges::find(telling.without, name) == telling.without.end())
+            AddJoint(name, parent, offset, telling);
+    }
+    AddFrames(telling);
+}
+
+void CMadeBody::AddJoint(const std::string& name, const std::string& parent, const Vec3& offset,
+                         const Telling& telling)
+{
+    CNode* node = nullptr;
+    if (parent.empty())
+        m_spkRoot = node = new CNode;
+    else
+        node = &AttachNode(Joint(parent));
+    node->SetName(name.c_str());
+    const Mat3 above = parent.empty() ? telling.world : telling.turn(parent);
+    AttachTrack(*node, telling.frameCount, kFrequency, Mat4Compose(kMat3Identity, Turned(offset, above)));
+    m_kNames.push_back(name);
+    m_kJoints.emplace(name, node);
+}
+
+// Keys and, as the reader of BVH files makes them, bone meshes.
+void CMadeBody::AddFrames(const Telling& telling)
+{
+    for (const std::string& name : m_kNames)
+    {
+        CNode& node = Joint(name);
+        auto& track = static_cast<CKeyframeControl&>(*node.GetControl());
+        const CNode* const parent = node.GetParentNode();
+        const Vec3 offset = track.m_kRestMatrix.Translation();
+        const Mat3 above = parent ? telling.turn(parent->GetName()) : telling.world;
+        for (int frame = 0; frame < telling.frameCount; ++frame)
+        {
+            track.m_kRotationKeys.push_back(
+                QuatFromMat3(Mat3Transpose(telling.turn(name)) * Pose(name, frame) * above));
+            const Vec3 place =
+                parent ? offset * (telling.doubled ? 2.0f : 1.0f) : Turned(RootPlace(frame), telling.world);
+            track.m_kPositionKeys.push_back(place);
+            track.m_kScaleKeys.push_back(kVec3One);
+        }
+        std::vector<Vec3> children;
+        for (const CNode* child : NodesOf(node))
+        {
+            if (child->GetParentNode() == &node)
+                children.push_back(RestLocal(*child).Translation());
+        }
+        if (children.empty())
+            children.push_back(Turned(name == "RHand" ? kHandEnd : Vec3{0, 5, 0}, telling.turn(name)));
+        CBoneMesh& mesh = AttachBone(node, name, children.size(), 1.0f);
+        mesh.m_kEnd = node.HasNoNodeChild() ? children[0] : kVec3Zero;
+        if (children.size() == 1)
+            mesh.m_kMatrix = Mat4Compose(BoneTurn(children[0]), kVec3Zero);
+    }
+    m_spkRoot->UpdateScene(0.0f, true);
+}
+
+CNode& CMadeBody::Joint(const std::string& name) const
+{
+    return *m_kJoints.at(name);
+}
+
+BodyMotion CMadeBody::Motion() const
+{
+    const auto joint = [this](const std::string& name) { return HasJoint(name) ? &Joint(name) : nullptr; };
+    BodyMotion motion{m_spkRoot.Get(), kFrequency, m_iFrames, {}};
+    CBodyMap& body = motion.body;
+    body.hip = joint("LowerTorso");
+    body.spine = {joint("Waist"), joint("UpperTorso")};
+    if (HasJoint("Neck"))
+        body.neck = {joint("Neck")};
+    body.head = joint("Head");
+    for (const EBodySide side : kBodySides)
+    {
+        const std::string s = side == EBodySide::Left ? "L" : "R";
+        body.Arm(side) = {joint(s + "Collar"), joint(s + "UpperArm"), joint(s + "Forearm"),
+                          joint(s + "Hand")};
+        body.Leg(side) = {joint(s + "Thigh"), joint(s + "Calf"), joint(s + "Foot"), joint(s + "Toe")};
+    }
+    return motion;
+}
+
+std::vector<Mat4> WorldsAt(CNode& root, float frequency, int frame)
+{
+    root.UpdateScene(static_cast<float>(frame) / frequency, true);
+    std::vector<Mat4> worlds;
+    for (const CNode* node : NodesOf(root))
+        worlds.push_back(node->m_kWorldMatrix);
+    return worlds;
+}
+
+} // namespace gw

@@ -1,0 +1,50 @@
+#pragma once
+
+#include "Alignment.h"
+#include "CNode.h"
+
+#include <functional>
+#include <map>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// A body that squats, turns and lifts its arms, in centimetres, told from a rest pose that suits the rules;
+/// and the same motion told from any other one. Its joints bear the target's names.
+class CMadeBody
+{
+public:
+    /// How the motion is told.
+    struct Telling
+    {
+        /// The turn A of a joint: seen from it, offsets o are o · A and world rotations inverse(A) · W.
+        std::function<Mat3(const std::string& joint)> turn = [](const std::string&) { return kMat3Identity; };
+        Mat3 world = kMat3Identity; ///< turns the whole motion
+        bool doubled = false;       ///< positions repeat the offsets
+        int frameCount = 40;
+        std::vector<std::string> without; ///< joints that are missing, with all below
+    };
+
+    explicit CMadeBody(const Telling& telling);
+
+    BodyMotion Motion() const;
+    CNode& Joint(const std::string& name) const;
+    bool HasJoint(const std::string& name) const { return m_kJoints.contains(name); }
+    const std::vector<std::string>& Names() const { return m_kNames; }
+
+private:
+    void AddJoint(const std::string& name, const std::string& parent, const Vec3& offset,
+                  const Telling& telling);
+    void AddFrames(const Telling& telling);
+
+    Ref<CNode> m_spkRoot;
+    std::vector<std::string> m_kNames; // depth first
+    std::map<std::string, CNode*> m_kJoints;
+    int m_iFrames;
+};
+
+/// The world matrices of all nodes of a tree at a frame, depth first.
+std::vector<Mat4> WorldsAt(CNode& root, float frequency, int frame);
+
+} // namespace gw

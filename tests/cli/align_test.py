@@ -1,0 +1,127 @@
+"""A motion told from another rest pose, through the program."""
+import json
+import math
+import unittest
+
+from harness import DONE, FAILED, USAGE, WALK, CliTest, main
+
+
+class Bvh:
+    """Joints with offsets and channel counts, and rows of numbers."""
+
+    def __init__(self, text):
+        head, _, tail = text.partition("MOTION")
+        self.offsets, self.channels, name, ends = {}, {}, None, 0
+        for line in head.splitlines():
+            words = line.split()
+            if words[:1] in (["ROOT"], ["JOINT"]):
+                name = words[1]
+            elif words[:1] == ["End"]:
+                ends += 1
+                name = f"end {ends}"
+            elif words[:1] == ["OFFSET"]:
+                self.offsets[name] = [float(x) for x in words[1:]]
+            elif words[:1] == ["CHANNELS"]:
+                self.channels[name] = words[2:]
+        rows = [line for line in tail.splitlines() if line.strip()]
+        self.frames = int(rows[0].split()[1])
+        self.rows = [[float(x) for x in row.split()] for row in rows[2:]]
+
+
+def hanging(text):
+    """A walk on a skeleton whose arms hang before the body at rest, in no plane with an axis."""
+    lines, joint = [], None
+    for line in text.splitlines():
+        words = line.split()
+        if words[:1] == ["JOINT"]:
+            joint = words[1]
+        if words[:1] == ["OFFSET"] and joint and joint[1:] in ("ForeArm", "Hand"):
+            x = float(words[1])
+            line = f"OFFSET 0 {-0.8 * abs(x)} {0.6 * abs(x)}"
+        lines.append(line)
+    return "\n".join(lines) + "\n"
+
+
+class Align(CliTest):
+    def places(self, name, frame):
+        nodes = json.loads(self.succeed("pose", name, "--frame", frame).out)["nodes"]
+        return {node["name"]: node["world"][12:15] for node in nodes}
+
+    def assert_same_places(self, first, second, frames):
+        for frame in frames:
+            a, b = self.places(first, frame), self.places(second, frame)
+            self.assertEqual(a.keys(), b.keys())
+            for joint, place in a.items():
+                self.assertLess(math.dist(place, b[joint]), 0.001, f"{joint} at frame {frame}")
+
+    def test_an_aligned_motion_has_all_frames_and_all_joints_where_they_were(self):
+        walk = self.write("walk.bvh", WALK.read_bytes())
+        result = self.succeed("align", "walk.bvh", "-o", "a.bvh")
+        self.assertIn("walk.bvh -> a.bvh", result.out)
+        before, after = Bvh(walk.read_text()), Bvh(self.read("a.bvh").decode())
+        self.assertEqual(before.frames, after.frames)
+        self.assertEqual(len(after.rows), after.frames)
+        self.assertEqual(list(before.offsets), list(after.offsets))
+        self.assert_same_places("walk.bvh", "a.bvh", (0, 1, before.frames // 2, before.frames - 1))
+
+    def test_aligning_twice_changes_nothing(self):
+        self.write("walk.bvh", WALK.read_bytes())
+        self.succeed("align", "walk.bvh", "-o", "a.bvh")
+        self.succeed("align", "a.bvh", "-o", "b.bvh")
+        a, b = Bvh(self.read("a.bvh").decode()), Bvh(self.read("b.bvh").decode())
+        for joint, offset in a.offsets.items():
+            self.assertLess(math.dist(offset, b.offsets[joint]), 1e-4, joint)
+        for first, second in zip(a.rows, b.rows):
+            self.assertLess(max(abs(x - y) for x, y in zip(first, second)), 0.01)
+
+    def test_arms_that_hang_at_rest_are_told_from_a_t_pose(self):
+        self.write("down.bvh", hanging(WALK.read_text()))
+        report = json.loads(self.succeed("align", "down.bvh", "-o", "a.bvh", "--json").out)
+        self.assertEqual(report["outcome"], "aligned")
+        self.assertIn(("rest-pose", "lShldr"), [(m["need"], m["joint"]) for m in report["mended"]])
+        offsets = Bvh(self.read("a.bvh").decode()).offsets
+        for joint, side in (("lForeArm", 1), ("lHand", 1), ("rForeArm", -1), ("rHand", -1)):
+            x, y, z = offsets[joint]
+            self.assertGreater(side * x, 20)
+            self.assertLess(math.hypot(y, z), 0.001)
+        self.assert_same_places("down.bvh", "a.bvh", (0, 9))
+
+    def test_arms_point_as_their_sources_do_whatever_the_rest_pose(self):
+        self.write("down.bvh", hanging(WALK.read_text()))
+        errors = {}
+        for name, options in (("plain", []), ("aligned", ["--align"])):
+            self.succeed("convert", "down.bvh", "-o", f"{name}.htr", "--profile", "Poser BVH", *options)
+            measures = json.loads(self.succeed("compare", "down.bvh", f"{name}.htr", "--profile", "Poser BVH",
+                                               "--json").out)
+            errors[name] = {bone["target"]: bone["meanError"] for bone in measures["bones"]}
+        for bone in ("LUpperArm", "RUpperArm", "LForearm", "RForearm", "Neck", "UpperTorso"):
+            self.assertLess(errors["aligned"][bone], 0.1, bone)
+        self.assertGreater(errors["plain"]["LUpperArm"], 20)
+
+    def test_what_cannot_be_aligned_is_said(self):
+        self.write("walk.bvh", WALK.read_bytes())
+        self.write("old.bvh", "old")
+        self.write("cut.bvh", WALK.read_bytes()[:900])
+        self.write("strange.bvh", WALK.read_text().replace("hip", "alpha").replace("neck", "beta"))
+        rows = [  # what, arguments, exit code, words
+            ("an output that exists", ("walk.bvh", "-o", "old.bvh"), FAILED, ["--force"]),
+            ("no .bvh", ("walk.bvh", "-o", "a.htr"), USAGE, [".bvh"]),
+            ("no output", ("walk.bvh",), USAGE, ["-o"]),
+            ("no source", ("none.bvh", "-o", "a.bvh"), FAILED, ["none.bvh"]),
+            ("a damaged source", ("cut.bvh", "-o", "a.bvh"), FAILED, ["cut.bvh"]),
+            ("a body that nothing names", ("strange.bvh", "-o", "a.bvh", "--profile", "Poser BVH"), FAILED,
+             ["strange.bvh", '"hip"']),
+        ]
+        before = self.files()
+        for what, arguments, code, words in rows:
+            with self.subTest(what):
+                result = self.with_assets("align", *arguments)
+                self.assertEqual(result.code, code, result.err)
+                self.assert_words(result, words)
+                self.assertEqual(self.files(), before)
+        self.assertEqual(self.read("old.bvh"), b"old")
+        self.assertEqual(self.with_assets("align", "walk.bvh", "-o", "old.bvh", "--force").code, DONE)
+
+
+if __name__ == "__main__":
+    main()
