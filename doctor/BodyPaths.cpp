@@ -54,7 +54,7 @@ UpAxis FindUpAxis(const BodyPaths& paths)
     return {axis, AlongAxis(sum, axis) < 0.0f};
 }
 
-double LegLength(const CBodyMap& body)
+double RestLegLength(const CBodyMap& body)
 {
     double sum = 0.0;
     for (const BodyLeg& leg : body.legs)

@@ -34,6 +34,6 @@ struct UpAxis
 UpAxis FindUpAxis(const BodyPaths& paths);
 
 /// Thigh and shin in the rest pose, the mean of both legs; 0 where a joint of them is not known.
-double LegLength(const CBodyMap& body);
+double RestLegLength(const CBodyMap& body);
 
 } // namespace gw

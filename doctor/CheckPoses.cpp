@@ -154,7 +154,7 @@ MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFi
     facts.frameCount = static_cast<size_t>(motion.GetKeyCount());
     facts.frameSeconds = static_cast<double>(motion.GetFrequency());
     facts.body = SourceOf(found);
-    facts.leg = LegLength(found.body);
+    facts.leg = RestLegLength(found.body);
     facts.unit = UnitOfLeg(facts.leg);
     facts.restPose = RestPoseOf(found.body);
     const BodyPaths paths = FollowBody(motion, found.body);

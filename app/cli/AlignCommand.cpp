@@ -55,15 +55,11 @@ std::string MendedText(const AlignReport& report)
     return text.empty() ? "nothing to mend" : text;
 }
 
-bool SelectProfile(const COptions& options, CShellWindow& window, CShellContent& content)
+bool SelectProfile(const COptions& options, CShellContent& content)
 {
-    if (!options.profile.empty())
-        return content.SelectProfile(options.profile);
-    CProfileFit best;
-    const bool fits = content.SelectFittingProfile(best);
-    if (!fits)
-        window.Report(NoneFitsReport(options.files[0], best));
-    return fits;
+    std::optional<CProfileFit> nearest;
+    return options.profile.empty() ? content.SelectFittingProfile(options.files[0], nearest)
+                                   : content.SelectProfile(options.profile);
 }
 
 void WriteJson(const COptions& options, const CShellWindow& window, const AlignReport& report, bool written)
@@ -91,7 +87,7 @@ void WriteJson(const COptions& options, const CShellWindow& window, const AlignR
 
 bool Align(const COptions& options, CShellWindow& window, CShellContent& content)
 {
-    return content.OpenSource() != 0 && !window.HasFailed() && SelectProfile(options, window, content) &&
+    return content.OpenSource() != 0 && !window.HasFailed() && SelectProfile(options, content) &&
            content.WriteAligned(options.output);
 }
 
