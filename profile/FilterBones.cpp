@@ -16,7 +16,7 @@ std::vector<int> FilterBones(const CBoneTree& tree, std::string_view text)
         if (LowerCase(tree.Text(item)).find(part) != std::string::npos)
             bones.push_back(item);
     }
-    std::ranges::stable_partition(bones, [&](int item) { return !tree.IsMapped(item); });
+    std::stable_partition(bones.begin(), bones.end(), [&](int item) { return !tree.IsMapped(item); });
     return bones;
 }
 

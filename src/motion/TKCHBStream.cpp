@@ -62,7 +62,7 @@ void TKCHBStream::ReadHeader(TKCHFile& file)
     ReadKeyword("VersionNumber");
     file.versionNumber = ReadInt();
     if (file.versionNumber > kNewestVersion)
-        Raise(EFailure::BadVersion, std::to_string(file.versionNumber), Location::current());
+        Raise(EFailure::BadVersion, std::to_string(file.versionNumber), __builtin_LINE());
     ReadKeyword("DataFrameRate");
     file.dataFrameRate = ReadInt();
     ReadKeyword("BeginFrame");
@@ -72,12 +72,12 @@ void TKCHBStream::ReadHeader(TKCHFile& file)
     ReadKeyword("NumSegments");
     file.numSegments = ReadInt();
     if (file.numSegments > kSegmentLimit)
-        Raise(EFailure::TooLarge, "NumSegments", Location::current());
+        Raise(EFailure::TooLarge, "NumSegments", __builtin_LINE());
     file.numSegments = std::max(file.numSegments, 0);
     file.CountFrames();
     const auto nodeCount = static_cast<size_t>(file.numSegments);
     if (file.beginFrame < 0 || !KeyTimesFit(file.frameCount, nodeCount, m_kFile.Bytes().size()))
-        Raise(EFailure::BadCount, "EndFrame", Location::current());
+        Raise(EFailure::BadCount, "EndFrame", __builtin_LINE());
 }
 
 void TKCHBStream::ReadLengths(TKCHFile& file)
@@ -128,7 +128,7 @@ void TKCHBStream::ReadFrame(int number)
 {
     ReadKeyword(kFrameKeyword);
     if (ReadInt() != number)
-        Raise(EFailure::MissingSection, "Frame " + std::to_string(number), Location::current(), LineText());
+        Raise(EFailure::MissingSection, "Frame " + std::to_string(number), __builtin_LINE(), LineText());
     for (TKCHSegment& work : m_kWork)
     {
         ReadFloats(work.matrices.emplace_back().m);
@@ -170,45 +170,45 @@ void TKCHBStream::AddBoneShape(const TKCHFile&, const TKCHSegment& segment, CNod
     AttachBone(node, segment.name, segment.children.size(), segment.length);
 }
 
-void TKCHBStream::ReadKeyword(std::string_view keyword, Location location)
+void TKCHBStream::ReadKeyword(std::string_view keyword, Line line)
 {
     ++m_iLine;
     const size_t start = m_uiPosition;
-    if (EqualNoCase(TakeBytes(keyword.size(), location), keyword))
+    if (EqualNoCase(TakeBytes(keyword.size(), line), keyword))
         return;
     m_uiPosition = start;
-    Raise(start == 0 ? EFailure::BadHeader : EFailure::MissingSection, std::string(keyword), location,
+    Raise(start == 0 ? EFailure::BadHeader : EFailure::MissingSection, std::string(keyword), line,
           LineText());
 }
 
-int TKCHBStream::ReadInt(Location location)
+int TKCHBStream::ReadInt(Line line)
 {
     int32_t value;
-    std::memcpy(&value, TakeBytes(sizeof value, location).data(), sizeof value);
+    std::memcpy(&value, TakeBytes(sizeof value, line).data(), sizeof value);
     return value;
 }
 
-void TKCHBStream::ReadFloats(std::span<float> values, Location location)
+void TKCHBStream::ReadFloats(std::span<float> values, Line line)
 {
-    std::memcpy(values.data(), TakeBytes(values.size_bytes(), location).data(), values.size_bytes());
+    std::memcpy(values.data(), TakeBytes(values.size_bytes(), line).data(), values.size_bytes());
     if (!std::ranges::all_of(values, [](float value) { return std::isfinite(value); }))
-        Raise(EFailure::BadNumber, {}, location);
+        Raise(EFailure::BadNumber, {}, line);
 }
 
-std::string_view TKCHBStream::ReadName(Location location)
+std::string_view TKCHBStream::ReadName(Line line)
 {
-    const std::string_view field = TakeBytes(kNameBytes, location);
+    const std::string_view field = TakeBytes(kNameBytes, line);
     const std::string_view name = field.substr(0, field.find('\0'));
     if (name.size() > kNameLimit)
-        Raise(EFailure::BadName, Quote(name), location);
+        Raise(EFailure::BadName, Quote(name), line);
     return name;
 }
 
-std::string_view TKCHBStream::TakeBytes(size_t count, Location location)
+std::string_view TKCHBStream::TakeBytes(size_t count, Line line)
 {
     const std::string_view rest = m_kFile.Text().substr(m_uiPosition);
     if (count > rest.size())
-        Raise(EFailure::Truncated, {}, location);
+        Raise(EFailure::Truncated, {}, line);
     m_uiPosition += count;
     return rest.substr(0, count);
 }
@@ -218,11 +218,11 @@ std::string TKCHBStream::LineText() const
     return "At Line: " + std::to_string(m_iLine);
 }
 
-void TKCHBStream::Raise(EFailure reason, const std::string& name, Location location, const std::string& what)
+void TKCHBStream::Raise(EFailure reason, const std::string& name, Line line, const std::string& what)
 {
     m_kRecord.Fail(reason, m_uiPosition, name);
     ERROBJ error{kErrorCode, {}, {}};
-    std::snprintf(error.where, sizeof error.where, "%s Line:%u", "TKCHBStream", location.line());
+    std::snprintf(error.where, sizeof error.where, "%s Line:%d", "TKCHBStream", line);
     std::snprintf(error.what, sizeof error.what, "%s", what.c_str());
     throw error;
 }

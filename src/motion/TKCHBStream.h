@@ -5,7 +5,6 @@
 #include "TKCHFile.h"
 
 #include <cstddef>
-#include <source_location>
 #include <span>
 #include <string>
 #include <string_view>
@@ -27,7 +26,9 @@ public:
     virtual void AddBoneShape(const TKCHFile& file, const TKCHSegment& segment, CNode& node);
 
 private:
-    using Location = std::source_location;
+    // The line of the source that asks, as a default argument tells it. Not every compiler that builds this
+    // has the library's class for it.
+    using Line = int;
 
     bool ReadFile(TKCHFile& file);
     void ReadHeader(TKCHFile& file);
@@ -38,12 +39,12 @@ private:
     void TakeFrames(TKCHFile& file);
     bool BuildAnimatedTree(TKCHFile& file);
 
-    void ReadKeyword(std::string_view keyword, Location location = Location::current());
-    int ReadInt(Location location = Location::current());
-    void ReadFloats(std::span<float> values, Location location = Location::current());
-    std::string_view ReadName(Location location = Location::current());
-    std::string_view TakeBytes(size_t count, Location location);
-    [[noreturn]] void Raise(EFailure reason, const std::string& name, Location location,
+    void ReadKeyword(std::string_view keyword, Line line = __builtin_LINE());
+    int ReadInt(Line line = __builtin_LINE());
+    void ReadFloats(std::span<float> values, Line line = __builtin_LINE());
+    std::string_view ReadName(Line line = __builtin_LINE());
+    std::string_view TakeBytes(size_t count, Line line);
+    [[noreturn]] void Raise(EFailure reason, const std::string& name, Line line,
                             const std::string& what = {});
     /// What an exception tells of a keyword or a frame that is another than it must be.
     std::string LineText() const;
