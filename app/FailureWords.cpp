@@ -48,7 +48,7 @@ constexpr Words<EFailure> kFailures[] = {
     Row(BlankLine, "blank-line", "an empty line where this keyword must stand", "take the empty line out"),
     Row(BadNumber, "bad-number", "a number is expected here, and this is none that can be used", kMendLine),
     Row(BadCount, "bad-count", "a count is larger than the rest of the file can hold", kCopyAgain),
-    Row(BadName, "bad-name", "a name is missing or longer than 255 characters",
+    Row(BadName, "bad-name", "a name is missing, holds a zero byte or is longer than 255 characters",
         "give the bone a shorter name"),
     Row(BadBrace, "bad-brace", "a brace is missing or stands where none belongs", kMendLine),
     Row(MissingTokens, "missing-tokens", "a line holds fewer values than it must", kMendLine),

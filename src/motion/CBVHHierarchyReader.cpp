@@ -84,7 +84,7 @@ bool CBVHHierarchyReader::ReadJoint(TKBVHJoint& joint, std::string_view rest, si
 bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
 {
     joint.name = NextToken(rest);
-    if (joint.name.size() > kNameLimit || (joint.name.empty() && joint.kind != EJointKind::EndSite))
+    if (!MayBeName(joint.name) || (joint.name.empty() && joint.kind != EJointKind::EndSite))
         return Fail(EFailure::BadName, joint.name);
     // A brace that stands here is missed below, which is worth more words than a name of two.
     const std::string_view more = NextToken(rest);

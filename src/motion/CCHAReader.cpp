@@ -174,7 +174,7 @@ bool CCHAReader::AddSegment(std::string_view line, bool& counts)
 {
     const std::string_view name = NextWord(line);
     const std::string_view parentName = NextWord(line);
-    if (name.size() > kNameLimit || parentName.size() > kNameLimit)
+    if (!MayBeName(name) || !MayBeName(parentName))
         return Fail(EFailure::BadName, name);
     counts = std::ssize(m_kFile.segments) < m_kFile.numSegments;
     if (counts)
@@ -232,7 +232,7 @@ bool CCHAReader::ReadRow(size_t index, std::string_view line)
     const std::string_view name = NextWord(line);
     if (index >= m_kPlaces.size())
         return Fail(EFailure::TooLarge, name);
-    if (name.size() > kNameLimit)
+    if (!MayBeName(name))
         return Fail(EFailure::BadName, name);
     Place& place = m_kPlaces[index];
     size_t count = 0;

@@ -146,7 +146,7 @@ bool CHTRReader::AddSegment(std::string_view line)
 {
     const std::string_view name = NextWord(line);
     const std::string_view parentName = NextWord(line);
-    if (name.size() > kNameLimit || parentName.size() > kNameLimit)
+    if (!MayBeName(name) || !MayBeName(parentName))
         return Fail(EFailure::BadName, name);
     if (m_kFile.segments.size() > kBoneLimit)
         return Fail(EFailure::TooLarge, name);

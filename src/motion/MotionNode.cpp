@@ -7,6 +7,11 @@
 
 namespace gw {
 
+bool MayBeName(std::string_view name)
+{
+    return name.size() <= kNameLimit && name.find('\0') == name.npos;
+}
+
 bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes)
 {
     // A row takes two bytes a node at the least, so that files of the usual kind stay far below this.

@@ -5,6 +5,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
+#include <string_view>
 #include <utility>
 #include <vector>
 
@@ -19,6 +20,9 @@ inline constexpr size_t kBoneLimit = 32768;
 
 /// Longer names of bones are refused.
 inline constexpr size_t kNameLimit = 255;
+/// Whether a bone may have a name: short enough, and without the zero byte that would end it early in the
+/// tree and in every file that is written of it.
+bool MayBeName(std::string_view name);
 
 /// Whether that many key times on that many nodes are in proportion to the file that asks for them: a count
 /// of frames is taken at its word, whatever rows follow.
