@@ -25,6 +25,7 @@ struct Line
     size_t m_uiBegin = 0; // in the whole text
     size_t m_uiEnd = 0;   // behind the last character, without the line end
     size_t m_uiEquals = std::string_view::npos;
+    std::string_view m_kClosing; // what it lacks where the text ends within it
 };
 
 // The end of a comment or of the line that a ";" cuts.
@@ -57,7 +58,19 @@ bool NextLineOf(std::string_view text, size_t from, Line& line)
             line.m_uiEquals = i;
     }
     line.m_uiEnd = std::min(i, text.size());
+    const bool isEscape = i > text.size(); // a backslash was the last character
+    line.m_kClosing = isEscape ? (quoted ? "\n\"" : "\n") : (quoted ? "\"" : "");
     return true;
+}
+
+// Closes a line that quotes or a backslash leave open: all that is added behind would be taken for a part of
+// it.
+void CloseLastLine(std::string& text)
+{
+    std::string_view closing;
+    for (Line line; NextLineOf(text, line.m_uiEnd, line);)
+        closing = line.m_kClosing;
+    text += closing;
 }
 
 // The section that a header line opens: empty for the part that has none.
@@ -113,15 +126,15 @@ std::optional<std::string> FindIniValue(std::string_view text, std::string_view 
 std::string SetIniValue(std::string_view text, std::string_view section, std::string_view key,
                         std::string_view value)
 {
-    text = SkipByteOrderMark(text);
-    const Place place = FindPlace(text, section, key);
+    std::string result(SkipByteOrderMark(text));
+    CloseLastLine(result);
+    const Place place = FindPlace(result, section, key);
     const std::string entry = EscapedIniKey(key) + '=' + EscapedIniValue(value);
-    std::string result(text);
     if (place.m_kEntry)
         return result.replace(place.m_kEntry->m_uiBegin, place.m_kEntry->m_uiEnd - place.m_kEntry->m_uiBegin,
                               entry);
     if (place.m_kSectionEnd)
-        return result.insert(EndOfPhysicalLine(text, *place.m_kSectionEnd), '\n' + entry);
+        return result.insert(EndOfPhysicalLine(result, *place.m_kSectionEnd), '\n' + entry);
     if (!result.empty())
         result += result.ends_with('\n') ? "\n" : "\n\n";
     return result + '[' + EscapedIniKey(section) + "]\n" + entry + '\n';
