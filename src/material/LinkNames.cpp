@@ -1,6 +1,7 @@
 #include "LinkNames.h"
 
 #include "Paths.h"
+#include "Text.h"
 
 #include <algorithm>
 #include <cstdint>
@@ -29,12 +30,19 @@ bool IsRegularFile(const std::string& path)
     return FileSize(path, byteCount);
 }
 
-// A name of the file in a folder, with this platform's separators.
+std::string_view LastPart(std::string_view name)
+{
+    return name.substr(name.find_last_of(kSeparators) + 1); // npos + 1 is 0
+}
+
+// A name of the file in a folder, with this platform's separators. One that leads out of the folder, whatever
+// way it takes, is that of another machine: its last part is what can be looked for here.
 std::string Join(const std::string& folder, std::string_view name)
 {
     std::string path(name);
     std::ranges::replace(path, '\\', kPathSeparator);
-    path = fs::path(path).lexically_normal().string(); // one file, one text
+    const fs::path normal = fs::path(path).lexically_normal(); // one file, one text
+    path = !normal.empty() && *normal.begin() == ".." ? LastPart(name) : normal.string();
     return folder.empty() ? path : folder + kPathSeparator + path;
 }
 
@@ -59,7 +67,7 @@ std::string ResolveLinkName(const std::string& folder, std::string_view name)
         return Join(folder, name.substr(name.find_first_of(kSeparators) + 1)); // npos + 1 is 0
     if (IsRegularFile(std::string(name)))
         return std::string(name);
-    return Join(folder, name.substr(name.find_last_of(kSeparators) + 1));
+    return Join(folder, LastPart(name));
 }
 
 std::string StoredLinkName(const std::string& folder, const std::string& path)
@@ -88,7 +96,7 @@ void NoteFailedLink(const std::string& folder, std::string_view objectName, cons
     if (file < 0)
         return;
     const std::string text =
-        "LinkFileName = " + std::string(objectName) + "\nLocalLinkFileName = " + path + '\n';
+        "LinkFileName = " + Printable(objectName) + "\nLocalLinkFileName = " + Printable(path) + '\n';
     [[maybe_unused]] const ssize_t written = write(file, text.data(), text.size());
     close(file);
 }

@@ -6,9 +6,9 @@
 namespace gw {
 
 /// The path that a stored link name means for a container in a folder. A relative name loses what stands
-/// before its first separator, on purpose; a name with a drive or from a root stays where such a file is, and
-/// otherwise its last part is looked for in the folder. Both separators count. An empty folder is the current
-/// one.
+/// before its first separator, on purpose, and never leads out of the folder; a name with a drive or from a
+/// root stays where such a file is, and otherwise its last part is looked for in the folder. Both separators
+/// count. An empty folder is the current one.
 std::string ResolveLinkName(const std::string& folder, std::string_view name);
 
 /// The name that a container in a folder stores for a path, so that ResolveLinkName finds it again: relative

@@ -69,17 +69,21 @@ TEST(LinkNames, LeadWhereTheRuleSays)
         std::string name;
         const char* path; // below the folder /scenes, or from the root
     } rows[] = {
-        {"a.png",                    "a.png"     },
-        {"textures\\a.png",          "a.png"     },
-        {"textures/a.png",           "a.png"     },
-        {"textures\\wood\\a.png",    "wood/a.png"},
-        {"..\\a.png",                "a.png"     },
-        {".\\wood//.\\a.png",        "wood/a.png"},
-        {"C:\\art\\wood\\a.png",     "a.png"     },
-        {"\\\\server\\share\\a.png", "a.png"     },
-        {"/nowhere/at/all/a.png",    "a.png"     },
-        {"C:a.png",                  "C:a.png"   },
-        {"\\a.png",                  "a.png"     },
+        {"a.png",                      "a.png"     },
+        {"textures\\a.png",            "a.png"     },
+        {"textures/a.png",             "a.png"     },
+        {"textures\\wood\\a.png",      "wood/a.png"},
+        {"..\\a.png",                  "a.png"     },
+        {".\\wood//.\\a.png",          "wood/a.png"},
+        {"C:\\art\\wood\\a.png",       "a.png"     },
+        {"\\\\server\\share\\a.png",   "a.png"     },
+        {"/nowhere/at/all/a.png",      "a.png"     },
+        {"C:a.png",                    "C:a.png"   },
+        {"\\a.png",                    "a.png"     },
+        {"x\\..\\a.png",               "a.png"     },
+        {"x/../../etc/a.png",          "a.png"     },
+        {"x\\wood\\..\\..\\..\\a.png", "a.png"     },
+        {"x\\wood\\..\\oak\\a.png",    "oak/a.png" },
     };
     for (const auto& row : rows)
     {
