@@ -62,6 +62,8 @@ public:
 
     /// Why something failed, or a warning. Comes before the fixed message of the same failure, if it has one.
     virtual void Report(const CReport&) {}
+    /// Whether a person looks at what is reported, so that a doubtful file is examined in full.
+    virtual bool ShowsFindings() const { return false; }
     /// A batch run takes up a file: number from 0 on, number of files, path.
     virtual void ShowBatchFile(size_t, size_t, const std::string&) {}
     /// Whether an operation has run so long that its user should see how far it is.

@@ -102,9 +102,12 @@ int CGaitConvertContent::Open(const std::string& path)
         m_pkSourceView->Stop();
     if (!LoadSource(path))
     {
+        ReportFindings(path);
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
         return 0;
     }
+    if (!m_bSourceIsContainer && !m_kSourceMotion.Record().Warnings().empty())
+        ReportFindings(path);
     m_kSourcePath = path;
     RememberFolder(path);
     AddRecentFile(path);

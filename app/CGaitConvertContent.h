@@ -114,6 +114,9 @@ public:
     std::string ExeFile(const std::string& name) override;
     bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
 
+    /// Drafts a profile for the open source, keeps it among the user's and shows it in the editor.
+    int DraftProfile();
+
     // Help
 
     /// The host product's executable; says so when there is none.
@@ -171,6 +174,11 @@ private:
     void NormalizeBasePose();
     void ReportMisfit();
     bool ReportMissingBones();
+
+    // DraftProfile.cpp
+    std::string DraftName() const;
+    void OpenDraft(const std::string& name);
+    void ReportFindings(const std::string& path);
 
     // SaveResult.cpp
     bool WritePackage(const std::string& path);

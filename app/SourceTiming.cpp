@@ -3,6 +3,8 @@
 #include "CKeyframeControl.h"
 #include "CMotionFile.h"
 
+#include <algorithm>
+#include <cmath>
 #include <vector>
 
 namespace gw {
@@ -46,6 +48,15 @@ CKeyframeControl* ConversionTrack(CNode* root)
 {
     CKeyframeControl* const named = FirstTrack(root, kTrackName, nullptr);
     return named ? named : PreviewTrack(root);
+}
+
+int ProfileRateOf(CNode* root)
+{
+    constexpr double kUsual = 30.0;
+    constexpr double kHighest = 240.0; // as the editor takes it
+    const CKeyframeControl* track = ConversionTrack(root);
+    const double rate = track && track->m_fFrequency > 0.0f ? 1.0 / track->m_fFrequency : kUsual;
+    return static_cast<int>(std::lround(std::clamp(rate, 1.0, kHighest)));
 }
 
 } // namespace gw

@@ -28,4 +28,8 @@ CKeyframeControl* PreviewTrack(CNode* root);
 /// The track that a container's conversion runs by: an object of a fixed name, else the one of the preview.
 CKeyframeControl* ConversionTrack(CNode* root);
 
+/// The frame rate for a profile made for a source, so that results last as long as it does: whole frames a
+/// second, at most what the editor takes.
+int ProfileRateOf(CNode* root);
+
 } // namespace gw

@@ -6,6 +6,7 @@
 #include "CSafeFile.h"
 #include "FindBone.h"
 #include "HostBones.h"
+#include "NewProfilePath.h"
 #include "Paths.h"
 #include "ProfileNames.h"
 #include "Text.h"
@@ -25,8 +26,6 @@ enum EMessage : int
     kAskOverwrite = 163,
 };
 
-constexpr int kCustomProfileCount = 9'999;
-
 constexpr const char* kShareFile = "KsBone.bsm";
 
 bool IsPelvis(std::string_view bone)
@@ -39,19 +38,6 @@ bool ReplaceFile(const std::string& path, std::string_view text)
 {
     CSafeFile file;
     return file.Open(path) && file.Write(text) && file.Commit();
-}
-
-// A path that no file or folder has yet; the last one of all where every number is taken.
-std::string NewProfilePath(CProfileOwner& owner)
-{
-    std::string path;
-    for (int number = 0; number < kCustomProfileCount; ++number)
-    {
-        path = owner.ProfileFile("Custom" + std::to_string(number) + ".prf");
-        if (!FileExists(path) && !FolderExists(path))
-            break;
-    }
-    return path;
 }
 
 void StoreCounts(int found, int rowCount, int* matched, int* total)

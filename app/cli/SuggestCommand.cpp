@@ -1,6 +1,5 @@
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
-#include "CKeyframeControl.h"
 #include "CMotionFile.h"
 #include "CSafeFile.h"
 #include "CShellContent.h"
@@ -14,8 +13,6 @@
 #include "Text.h"
 #include "Words.h"
 
-#include <algorithm>
-#include <cmath>
 #include <cstdio>
 
 namespace gw {
@@ -171,16 +168,6 @@ EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
     return EExit::Failed;
 }
 
-// The rate of the source, so that a result lasts as long as the source does.
-int FrameRateOf(CNode* root)
-{
-    constexpr double kUsual = 30.0;
-    constexpr double kHighest = 240.0; // as the editor takes it
-    const CKeyframeControl* track = ConversionTrack(root);
-    const double rate = track && track->m_fFrequency > 0.0f ? 1.0 / track->m_fFrequency : kUsual;
-    return static_cast<int>(std::lround(std::clamp(rate, 1.0, kHighest)));
-}
-
 bool WriteProfile(const std::string& path, const std::string& text)
 {
     CSafeFile file;
@@ -239,7 +226,7 @@ EExit RunSuggest(const COptions& options)
     const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *target.motionRoot);
     if (!profile.missing.empty())
         return FailMissing(options.files[0], profile);
-    return Deliver(options, profile, FrameRateOf(content.SourceRoot()));
+    return Deliver(options, profile, ProfileRateOf(content.SourceRoot()));
 }
 
 } // namespace gw

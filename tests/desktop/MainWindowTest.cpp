@@ -3,6 +3,7 @@
 #include "QtText.h"
 
 #include <QApplication>
+#include <QComboBox>
 #include <QLabel>
 #include <QMenu>
 #include <QMouseEvent>
@@ -10,6 +11,7 @@
 #include <QTest>
 #include <fstream>
 #include <gmock/gmock.h>
+#include <sstream>
 
 namespace gw {
 
@@ -45,6 +47,33 @@ bool ShowsSomething(const QImage& picture)
         }
     }
     return false;
+}
+
+void ChooseOption(CPerson& person, int row)
+{
+    person.Click("options");
+    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
+    auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
+    QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
+                      menu->actionGeometry(menu->actions()[row]).center());
+    ASSERT_TRUE(person.WaitUntil([] { return !QApplication::activePopupWidget(); }));
+}
+
+// The example's motion with names that say nothing.
+std::string NamelessWalk(const std::string& folder)
+{
+    std::istringstream lines(ReadBytes(ExampleFile("walk.bvh")));
+    std::string text;
+    int number = 0;
+    for (std::string line; std::getline(lines, line);)
+    {
+        const size_t name = std::min(line.find("ROOT "), line.find("JOINT "));
+        if (name != line.npos)
+            line = line.substr(0, line.find(' ', name)) + " piece" + std::to_string(number++);
+        text += line + '\n';
+    }
+    WriteBytes(folder + "nameless.bvh", text);
+    return folder + "nameless.bvh";
 }
 
 std::string CopyTo(const std::string& folder, const char* example, const char* name)
@@ -223,32 +252,49 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     person.Drop(broken);
     EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("Invalid BVH file format.")});
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("broken.bvh:2:"));
+
+    std::string fivefold = ReadBytes(ExampleFile("walk.bvh"));
+    fivefold.insert(fivefold.find("Frames:"), "\n");
+    fivefold.replace(fivefold.find("JOINT ") + 6, 0, "my ");
+    WriteBytes(broken, fivefold);
+    person.WillAnswer("ok");
+    person.Drop(broken);
+    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("a blank"))
+        << "all that is wrong is told, not just what came first";
     EXPECT_TRUE(person.IsOn("convert")) << "the source before stays";
 }
 
 TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
 {
     CPerson person;
-    const auto choose = [&](int row) {
-        person.Click("options");
-        ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
-        auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
-        QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
-                          menu->actionGeometry(menu->actions()[row]).center());
-        ASSERT_TRUE(person.WaitUntil([] { return !QApplication::activePopupWidget(); }));
-    };
     const auto shown = [&] { return static_cast<QLabel*>(person.Child("#choices"))->text(); };
     EXPECT_EQ(shown(), QString());
-    choose(1);
+    ChooseOption(person, 1);
     EXPECT_TRUE(person.Content().Choices().faithful);
     EXPECT_FALSE(person.Content().Choices().align);
     EXPECT_EQ(shown(), QStringLiteral("faithful"));
-    choose(0);
+    ChooseOption(person, 0);
     EXPECT_EQ(shown(), QStringLiteral("aligned, faithful"));
-    choose(1);
+    ChooseOption(person, 1);
     EXPECT_EQ(shown(), QStringLiteral("aligned"));
     person.Restart();
     EXPECT_EQ(shown(), QString());
+}
+
+TEST(MainWindow, ABoneMapIsDraftedForASourceThatNoneFits)
+{
+    constexpr int kDraft = 3; // behind the separator
+    CPerson person;
+    person.Drop(NamelessWalk(person.Home().Path()));
+    person.Click("convert");
+    EXPECT_FALSE(person.Content().IsConverted());
+    ChooseOption(person, kDraft);
+    ASSERT_TRUE(person.WaitUntil([&] { return person.Content().ProfileEditor()->IsVisible(); }));
+    EXPECT_EQ(static_cast<QComboBox*>(person.Child("#format"))->currentText(), QStringLiteral("nameless"));
+    person.Click("convert");
+    EXPECT_TRUE(person.Content().IsConverted());
+    ChooseOption(person, kDraft);
+    EXPECT_EQ(static_cast<QComboBox*>(person.Child("#format"))->currentText(), QStringLiteral("nameless 2"));
 }
 
 TEST(MainWindow, ASecondClickOnTheCornerCloses)

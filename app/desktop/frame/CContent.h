@@ -49,6 +49,7 @@ public:
     std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override;
     void Report(const CReport& report) override;
+    bool ShowsFindings() const override { return true; }
     bool IsProgressDue() override;
     void StayPainted() override;
     void BeginWaitCursor() override;

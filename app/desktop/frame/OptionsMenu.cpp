@@ -50,6 +50,13 @@ QMenu* MakeOptionsMenu(CGaitConvertContent& logic, QWidget* owner)
     menu->setToolTipsVisible(true);
     for (const Choice& choice : kChoices)
         AddChoice(*menu, logic, choice);
+    menu->addSeparator();
+    QAction* const draft =
+        menu->addAction(QCoreApplication::translate("OptionsMenu", "Draft a bone map for this source"));
+    draft->setToolTip(QCoreApplication::translate(
+        "OptionsMenu", "By the names of its joints, else by its shape; opens in the editor"));
+    draft->setEnabled(logic.SourceRoot() != nullptr);
+    QObject::connect(draft, &QAction::triggered, menu, [&logic] { logic.DraftProfile(); });
     return menu;
 }
 

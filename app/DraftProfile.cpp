@@ -1,0 +1,127 @@
+// A profile drafted for the open source, and what is wrong with a file that reads badly.
+
+#include "CBoneMapProfile.h"
+#include "CContentWindow.h"
+#include "CFileExam.h"
+#include "CGaitConvertContent.h"
+#include "CProfileEditorDialog.h"
+#include "CSafeFile.h"
+#include "CWaitCursor.h"
+#include "FailureWords.h"
+#include "FindingWords.h"
+#include "NewProfilePath.h"
+#include "Paths.h"
+#include "ProfileFile.h"
+#include "SourceTiming.h"
+#include "SuggestProfile.h"
+#include "Text.h"
+
+#include <filesystem>
+
+namespace gw {
+
+namespace {
+
+constexpr uint64_t kExamBytesLimit = uint64_t{64} << 20; // more would keep a person waiting
+
+CReport Note(const std::string& path, const char* code, std::string words)
+{
+    CReport report;
+    report.warning = true;
+    report.path = path;
+    report.code = code;
+    report.words = std::move(words);
+    return report;
+}
+
+// The rows that a person should look at, or empty.
+std::string UnsureRows(const SuggestedProfile& draft)
+{
+    std::string names;
+    for (const SuggestedRow& row : draft.rows)
+    {
+        if (row.IsMapping() && row.sureness == ERowSureness::Unsure)
+            names += (names.empty() ? "" : ", ") + row.target;
+    }
+    return names;
+}
+
+bool IsShort(const std::string& path)
+{
+    std::error_code error;
+    const uint64_t size = std::filesystem::file_size(path, error);
+    return !error && size <= kExamBytesLimit;
+}
+
+} // namespace
+
+// A name that no profile has yet, since one of the same name could not be reached.
+std::string CGaitConvertContent::DraftName() const
+{
+    const std::string name = SuggestedName(SplitPath(m_kSourcePath).stem);
+    std::string free = name;
+    for (int number = 2; IsListed(free); ++number)
+        free = name + ' ' + std::to_string(number);
+    return free;
+}
+
+int CGaitConvertContent::DraftProfile()
+{
+    CNode* const target = m_kBaseMotion.motionRoot.Get();
+    if (!SourceRoot() || !target || !m_pkProfile)
+        return 0;
+    const CWaitCursor wait(m_kWindow);
+    const SuggestedProfile draft = SuggestProfile(*SourceRoot(), *target);
+    if (!draft.missing.empty())
+    {
+        m_kWindow.ShowMessageBox(0, "This source has no body that a bone map could be drafted for.",
+                                 EButtons::OK);
+        return 0;
+    }
+    const std::string name = DraftName();
+    const std::string path = NewProfilePath(*this);
+    CSafeFile file;
+    if (!file.Open(path) ||
+        !file.Write(ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())) ||
+        !file.Commit())
+    {
+        m_kWindow.Report(MakeReport(path, {EFailure::WriteError, 0, {}}, false));
+        m_kWindow.ShowMessageBox(0, "The drafted bone map cannot be written.", EButtons::OK);
+        return 0;
+    }
+    OpenDraft(name);
+    if (const std::string rows = UnsureRows(draft); !rows.empty())
+        m_kWindow.Report(Note(path, "unsure-rows", "look at these rows of the bone map: " + Printable(rows)));
+    return 1;
+}
+
+// Selects a new profile and shows it in the editor.
+void CGaitConvertContent::OpenDraft(const std::string& name)
+{
+    RefreshProfileList();
+    SelectProfileByName(name);
+    m_pkProfileDialog->Show();
+    m_kWindow.ShowProfileEditor(true);
+    UpdateControls();
+}
+
+// What a reader trips over is told in full where a person can unfold it.
+void CGaitConvertContent::ReportFindings(const std::string& path)
+{
+    if (!m_kWindow.ShowsFindings() || !HasExtension(path, ".bvh") || !IsShort(path))
+        return;
+    CFileExam exam;
+    exam.ExamineBVH(path);
+    for (const Finding& finding : exam.Findings().Sorted())
+    {
+        if (finding.severity == ESeverity::Note || finding.fault == EFault::Reader)
+            continue;
+        CReport report = Note(path, std::string(FindingCode(finding)).c_str(), FindingWords(path, finding));
+        report.where = finding.where;
+        if (!FindingRemedy(finding).empty())
+            report.words += " (" + std::string(FindingRemedy(finding)) + ')';
+        m_kWindow.Report(report);
+    }
+}
+
+} // namespace gw
