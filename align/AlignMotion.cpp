@@ -41,8 +41,9 @@ size_t ChildJoints(const CNode& node)
 class CMotionAligner
 {
 public:
-    CMotionAligner(const BodyMotion& motion, const Alignment& alignment)
-        : m_kMotion(motion), m_kAlignment(alignment), m_kScales(alignment.joints.size(), kVec3One)
+    CMotionAligner(const BodyMotion& motion, const Alignment& alignment, EAlignedJoints joints)
+        : m_kMotion(motion), m_kAlignment(alignment), m_eJoints(joints),
+          m_kScales(alignment.joints.size(), kVec3One)
     {
     }
     AlignedMotion Align();
@@ -52,16 +53,22 @@ private:
     {
         return joint.parent < 0 ? m_kAlignment.worldTurn : Turns(joint.parent);
     }
+    bool Moves(const JointAlignment& joint) const
+    {
+        return joint.bearsBody || m_eJoints == EAlignedJoints::All;
+    }
     const Mat3& Turns(int joint) const { return m_kAlignment.joints[static_cast<size_t>(joint)].turn; }
     void AddJoint(const JointAlignment& joint);
+    CKeyframeControl& AddTrack(CNode& node);
     void AddBone(const JointAlignment& joint, CNode& node);
     void AddKey(size_t index, int frame);
 
     const BodyMotion& m_kMotion;
     const Alignment& m_kAlignment;
+    EAlignedJoints m_eJoints;
     AlignedMotion m_kResult;
-    std::vector<CKeyframeControl*> m_kTracks;
-    std::vector<Vec3> m_kScales; // of each joint in the world, at the frame
+    std::vector<CKeyframeControl*> m_kTracks; // null where a joint does not move
+    std::vector<Vec3> m_kScales;              // of each joint in the world, at the frame
 };
 
 void CMotionAligner::AddJoint(const JointAlignment& joint)
@@ -74,11 +81,16 @@ void CMotionAligner::AddJoint(const JointAlignment& joint)
     node->SetName(joint.node->GetName());
     m_kResult.joints.push_back(node);
     const Vec3 offset = Turned(joint.restOffset, ParentTurn(joint));
-    CKeyframeControl& track =
-        AttachTrack(*node, m_kMotion.frameCount, m_kMotion.frequency, Mat4Compose(kMat3Identity, offset));
-    track.m_kRotationKeys.reserve(track.m_kKeyTimes.size());
-    m_kTracks.push_back(&track);
+    node->m_kMatrix.SetTranslation(offset);
     AddBone(joint, *node);
+    m_kTracks.push_back(Moves(joint) ? &AddTrack(*node) : nullptr);
+}
+
+CKeyframeControl& CMotionAligner::AddTrack(CNode& node)
+{
+    CKeyframeControl& track = AttachTrack(node, m_kMotion.frameCount, m_kMotion.frequency, node.m_kMatrix);
+    track.m_kRotationKeys.reserve(track.m_kKeyTimes.size());
+    return track;
 }
 
 void CMotionAligner::AddBone(const JointAlignment& joint, CNode& node)
@@ -124,9 +136,17 @@ AlignedMotion CMotionAligner::Align()
     CMotionSampler sampler(*m_kMotion.root);
     for (int frame = 0; frame < m_kMotion.frameCount; ++frame)
     {
-        sampler.PoseTree(TimeOfFrame(frame, m_kMotion.frequency));
+        const float time = TimeOfFrame(frame, m_kMotion.frequency);
+        if (!sampler.PosesNodes())
+            sampler.PoseTree(time);
         for (size_t index = 0; index < m_kTracks.size(); ++index)
+        {
+            if (!m_kTracks[index])
+                continue;
+            if (sampler.PosesNodes())
+                sampler.PoseNode(index, time);
             AddKey(index, frame);
+        }
     }
     m_kMotion.root->UpdateScene(0.0f, true);
     m_kResult.root->UpdateScene(0.0f, true);
@@ -135,9 +155,9 @@ AlignedMotion CMotionAligner::Align()
 
 } // namespace
 
-AlignedMotion AlignMotion(const BodyMotion& motion, const Alignment& alignment)
+AlignedMotion AlignMotion(const BodyMotion& motion, const Alignment& alignment, EAlignedJoints joints)
 {
-    return CMotionAligner(motion, alignment).Align();
+    return CMotionAligner(motion, alignment, joints).Align();
 }
 
 } // namespace gw

@@ -30,6 +30,7 @@ struct JointAlignment
     Vec3 restOffset = kVec3Zero; ///< in the parent's space, as the file has it
     Vec3 axis = kVec3Zero;       ///< along which the bone lies in the aligned rest pose; zero for any
     bool tellOnce = false;       ///< positions repeat the offset: it is taken off them once
+    bool bearsBody = false;      ///< a joint of the body stands here or below
 };
 
 /// How a motion is told from a rest pose that suits the rules. Joints stand depth first.

@@ -76,6 +76,16 @@ bool IsFinite(const std::vector<Mat3>& turns)
     return true;
 }
 
+// Helpers between two joints of the body bear the lower one.
+void MarkBearers(std::vector<JointAlignment>& joints)
+{
+    for (auto joint = joints.rbegin(); joint != joints.rend(); ++joint)
+    {
+        if (joint->bearsBody && joint->parent >= 0)
+            joints[static_cast<size_t>(joint->parent)].bearsBody = true;
+    }
+}
+
 // One planning of one motion, step by step.
 class CAlignmentPlanner
 {
@@ -137,8 +147,10 @@ void CAlignmentPlanner::FillJoints(const std::vector<Mat3>& turns, const CRefere
     {
         CNode* const joint = m_kTree.Joints()[i];
         m_kAlignment.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], RestLocal(*joint).Translation(),
-                                       AxisOf(m_kRoles[i]), m_kDoubled[i]});
+                                       AxisOf(m_kRoles[i]), m_kDoubled[i],
+                                       m_kRoles[i].part != EBodyPart::None});
     }
+    MarkBearers(m_kAlignment.joints);
 }
 
 bool CAlignmentPlanner::Plan()

@@ -52,7 +52,7 @@ int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
 
 // Aligns the source for the rows that the retargeter was told, and lets these drive the target from the
 // aligned copy: the source stays as it is. False, with the reason reported, where the rows make no body.
-bool CGaitConvertContent::AlignSource(const SourceTiming& timing)
+bool CGaitConvertContent::AlignSource(const SourceTiming& timing, EAlignedJoints joints)
 {
     CNode& target = *m_kResultMotion.motionRoot;
     CFailureRecord record;
@@ -68,7 +68,7 @@ bool CGaitConvertContent::AlignSource(const SourceTiming& timing)
         m_kWindow.Report(MakeReport(m_kSourcePath, EMisfit::NoBody));
         return false;
     }
-    const AlignedMotion aligned = AlignMotion(source, alignment);
+    const AlignedMotion aligned = AlignMotion(source, alignment, joints);
     AimBones(*m_kRetargeter, target, source, alignment, aligned);
     m_spkAligned = aligned.root;
     m_kAlignReport = std::move(alignment.report);
@@ -95,7 +95,7 @@ bool CGaitConvertContent::WriteAligned(const std::string& path)
 {
     m_kWriteRecord.Clear();
     const SourceTiming timing = ConversionTiming();
-    if (!m_kResultMotion.motionRoot || !PrepareRetargeter() || !AlignSource(timing))
+    if (!m_kResultMotion.motionRoot || !PrepareRetargeter() || !AlignSource(timing, EAlignedJoints::All))
         return false;
     TKBVHStream stream;
     stream.motionRoot = m_spkAligned;

@@ -22,6 +22,7 @@ class CBoneMapProfile;
 class CContentWindow;
 class CPlatform;
 class CProfileEditorDialog;
+enum class EAlignedJoints : uint8_t;
 struct SourceTiming;
 
 /// Where the target's root stands in the rest pose and in the first frame, in the target skeleton's own unit.
@@ -162,7 +163,7 @@ private:
     void Report(const std::string& path, const CFailureRecord& record);
 
     // AlignSource.cpp
-    bool AlignSource(const SourceTiming& timing);
+    bool AlignSource(const SourceTiming& timing, EAlignedJoints joints);
     void ReportRestMisfits();
 
     // ConvertMotion.cpp

@@ -1,5 +1,6 @@
 // From the open source and the profile to the target's motion.
 
+#include "AlignMotion.h"
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
 #include "CProfileEditorDialog.h"
@@ -83,7 +84,7 @@ bool CGaitConvertContent::PrepareSource(const SourceTiming& timing)
 {
     m_spkAligned = nullptr;
     if (m_kChoices.align)
-        return AlignSource(timing);
+        return AlignSource(timing, EAlignedJoints::Body);
     ReportRestMisfits();
     return true;
 }

@@ -63,6 +63,17 @@ Mat3 TurnedKnees(const std::string& joint)
     return IsOneOf(joint, {"Thigh", "Calf"}) ? TurnAbout(kVec3UnitY, 70.0) : kMat3Identity;
 }
 
+// What a rest pose shows of hands and feet is not always how they are held and stand.
+Mat3 RolledHand(const std::string& joint)
+{
+    return joint == "LHand" ? TurnAbout(kVec3UnitX, 55.0) : kMat3Identity;
+}
+
+Mat3 HangingFeet(const std::string& joint)
+{
+    return IsOneOf(joint, {"Foot", "Toe"}) ? TurnAbout(kVec3UnitX, 35.0) : kMat3Identity;
+}
+
 struct TellingRow
 {
     const char* what;
@@ -74,19 +85,27 @@ struct TellingRow
 // What a pose of the motion tells is not to the degree; a rest pose is.
 std::vector<TellingRow> Tellings()
 {
+    const Mat3 none = kMat3Identity;
     const Mat3 zUp = TurnAbout(kVec3UnitX, 90.0);
+    const Turn straight = Everywhere(none);
+    const Turn spread = ArmsDown(45.0);
+    const Turn down = ArmsDown(88.0);
+    const Turn standing = Everywhere(zUp);
+    const Turn back = Everywhere(TurnAbout(kVec3UnitY, 180.0));
     return {
-        {"a T-pose already",            Everywhere(kMat3Identity),       kMat3Identity, 0.1                                    },
-        {"an A-pose",                   ArmsDown(45.0),                  kMat3Identity, 0.1                                    },
-        {"arms that hang",              ArmsDown(88.0),                  kMat3Identity, 0.1                                    },
-        {"a rest pose with Z up",       Everywhere(zUp),                 kMat3Identity, 0.1                                    },
-        {"a motion with Z up",          Everywhere(zUp),                 zUp,           0.1                                    },
-        {"Z up in the motion alone",    Everywhere(kMat3Identity),       zUp,           0.1                                    },
-        {"a rest pose that faces back", Everywhere(TurnAbout(kVec3UnitY, 180.0)),       kMat3Identity,                           0.1},
-        {"bones along X",                             AlongX,                                              kMat3Identity,                         12.0     },
-        {"bones along X, with Z up",                             AlongX,                                   zUp,              12.0          },
-        {"slanted shins",                             Slanted,                                              kMat3Identity,                        0.1},
-        {"knees that bend to the side",                             TurnedKnees,                                kMat3Identity,      2.0      },
+        {"a T-pose already", straight, none, 0.1},
+        {"an A-pose", spread, none, 0.1},
+        {"arms that hang", down, none, 0.1},
+        {"a rest pose with Z up", standing, none, 0.1},
+        {"a motion with Z up", standing, zUp, 0.1},
+        {"Z up in the motion alone", straight, zUp, 0.1},
+        {"a rest pose that faces back", back, none, 0.1},
+        {"bones along X", AlongX, none, 12.0},
+        {"bones along X, with Z up", AlongX, zUp, 12.0},
+        {"slanted shins", Slanted, none, 0.1},
+        {"knees that bend to the side", TurnedKnees, none, 2.0},
+        {"a hand rolled at rest", RolledHand, none, 0.1},
+        {"feet that hang at rest", HangingFeet, none, 1.0},
     };
 }
 
