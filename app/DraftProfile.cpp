@@ -41,7 +41,7 @@ std::string UnsureRows(const SuggestedProfile& draft)
     for (const SuggestedRow& row : draft.rows)
     {
         if (row.IsMapping() && row.sureness == ERowSureness::Unsure)
-            names += (names.empty() ? "" : ", ") + row.target;
+            names.append(names.empty() ? "" : ", ").append(row.target);
     }
     return names;
 }

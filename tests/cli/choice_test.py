@@ -50,7 +50,7 @@ class Choice(CliTest):
         self.succeed("convert", "a.bvh", "-o", "named.htr", "--profile", "Max BVH")
         self.assertEqual(self.read("a.htr"), self.read("named.htr"))
         self.write("b.bvh", body(family="Chest"))
-        self.assertEqual(self.succeed("convert", "b.bvh", "-o", "b.htr").err, "")
+        self.assertNotIn("left and right", self.succeed("convert", "b.bvh", "-o", "b.htr").err)
 
     def test_spine_joints_beyond_every_profile_are_told(self):
         self.write("a.bvh", body(spine=12))

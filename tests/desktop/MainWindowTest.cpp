@@ -1,4 +1,5 @@
 #include "CPerson.h"
+#include "CProfileEditorDialog.h"
 #include "Paths.h"
 #include "QtText.h"
 
