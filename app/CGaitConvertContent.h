@@ -138,6 +138,8 @@ public:
     CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
     /// The root of the open source, be it a motion file's or a container's; null when nothing is open.
     CNode* SourceRoot() const;
+    /// What the last conversion read: the source, or its aligned copy.
+    CNode* DrivingRoot() const { return m_spkAligned ? m_spkAligned.Get() : SourceRoot(); }
     const CMotionFile& ResultMotion() const { return m_kResultMotion; }
     bool IsConverted() const { return m_bConverted; }
     bool IsSaved() const { return m_bSaved; }

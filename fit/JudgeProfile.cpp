@@ -16,6 +16,11 @@ namespace {
 // Half way from a frame that stands right to one that stands across, with room for a limb that is bent.
 constexpr double kAcross = 60.0;
 
+std::string NameOf(const CNode* joint)
+{
+    return joint ? std::string(joint->NameView()) : std::string();
+}
+
 bool IsOneOf(const std::vector<CNode*>& joints, const CNode* joint)
 {
     return std::ranges::find(joints, joint) != joints.end();
@@ -38,7 +43,7 @@ void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict&
         CNode* const joint = JointAt(body, place);
         CNode* const named = JointAt(byNames, place);
         if (joint && named && !IsSamePlace(place, byNames, joint))
-            verdict.doubts.push_back({EProfileDoubt::OtherName, {}, joint, named});
+            verdict.doubts.push_back({EProfileDoubt::OtherName, {}, NameOf(joint), NameOf(named)});
     }
 }
 
@@ -68,7 +73,7 @@ void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdic
         return;
     verdict.leftOut = static_cast<size_t>(body.spine.end() - place - 1);
     if (verdict.leftOut > 0)
-        verdict.doubts.push_back({EProfileDoubt::SpineCut, {}, chest, body.spine.back()});
+        verdict.doubts.push_back({EProfileDoubt::SpineCut, {}, NameOf(chest), NameOf(body.spine.back())});
 }
 
 void CheckTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body, ProfileVerdict& verdict)
@@ -78,7 +83,7 @@ void CheckTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& bod
     {
         verdict.turn += turn.degrees / static_cast<double>(turns.size());
         if (turn.degrees > kAcross)
-            verdict.doubts.push_back({EProfileDoubt::Turned, {}, table.SourceOf(turn.target), nullptr});
+            verdict.doubts.push_back({EProfileDoubt::Turned, {}, NameOf(table.SourceOf(turn.target)), {}});
     }
 }
 
@@ -103,7 +108,7 @@ ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const S
     AddUntold(source.byNames, body);
     ProfileVerdict verdict;
     for (const BodyDoubt& doubt : CheckBody(body, source.tree))
-        verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, JointAt(body, doubt.place), nullptr});
+        verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
     CheckSpine(body, table.SourceOf(FindNode(&targetRoot, "UpperTorso")), verdict);
     CheckTurns(table, targetRoot, body, verdict);

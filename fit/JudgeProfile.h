@@ -6,6 +6,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <string>
 #include <vector>
 
 namespace gw {
@@ -40,8 +41,8 @@ struct ProfileDoubt
 {
     EProfileDoubt kind = EProfileDoubt::Places;
     EBodyDoubt places = EBodyDoubt::NotBelow; ///< of Places
-    const CNode* joint = nullptr;             ///< of the source
-    const CNode* other = nullptr;             ///< of the source, or null
+    std::string joint;                        ///< name of a joint of the source
+    std::string other;                        ///< the same, or empty
 };
 
 /// What is told of a profile whose rows all fit.

@@ -14,11 +14,11 @@ namespace gw {
 // but for rounding.
 
 /// How one mapped bone points. The direction of a bone is that from its joint to the next joint below that is
-/// not at the same place: towards the nearest mapped bone below, else along the first child. Where a bone
-/// branches into several mapped ones, the branch counts that leaves least sideways (x) in the result's rest
-/// pose: the spine for a hip, the neck for a chest. Source and result each take a joint on the way to the
-/// same mapped bone; where that bone's source is not below this bone's (a collar that drives the torso), the
-/// source's direction begins where the two branch.
+/// not at the same place: towards the nearest mapped bone below, else along the branch that goes on farthest.
+/// Where a bone branches into several mapped ones, the branch counts that leaves least sideways (x) in the
+/// result's rest pose: the spine for a hip, the neck for a chest. Source and result each take a joint on the
+/// way to the same mapped bone; where that bone's source is not below this bone's (a collar that drives the
+/// torso), the source's direction begins where the two branch.
 struct BoneMeasures
 {
     std::string target;      ///< bone of the result

@@ -26,15 +26,6 @@ public:
     void Report(const CReport&) override {}
 };
 
-// A source moves by the track by which it was converted.
-MotionClip SourceClip(const CShellContent& content)
-{
-    const CKeyframeControl* track = ConversionTrack(content.SourceRoot());
-    if (!track)
-        return {};
-    return {content.SourceRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
-}
-
 // New tracks rest in the pose that the rules made of the source's rest; a saved result rests in the target's
 // own, and so is it measured.
 void TakeRestPose(const CMotionFile& result)
@@ -50,13 +41,21 @@ void TakeRestPose(const CMotionFile& result)
 
 } // namespace
 
+MotionClip SourceClipOf(const CShellContent& content)
+{
+    const CKeyframeControl* track = ConversionTrack(content.SourceRoot());
+    if (!track)
+        return {};
+    return {content.DrivingRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
+}
+
 ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job)
 {
     ConvertedMotion motion;
     motion.source = job.source;
     motion.result = job.output;
     TakeRestPose(content.ResultMotion());
-    motion.sourceClip = SourceClip(content);
+    motion.sourceClip = SourceClipOf(content);
     motion.resultClip = ClipOf(content.ResultMotion());
     return motion;
 }

@@ -10,6 +10,10 @@ class CShellContent;
 struct CConversionJob;
 struct COptions;
 
+/// The source of a content that has converted, as the conversion read it; it moves by the track by which it
+/// was converted.
+MotionClip SourceClipOf(const CShellContent& content);
+
 /// The open source and the result of a content that has converted, as clips of trees that live with it; named
 /// after the job. The result is saved already: its tracks take the target's rest pose.
 ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job);

@@ -88,8 +88,9 @@ constexpr CCommand kCommands[] = {
         "look at the rows that are called unsure before you convert many files with the profile.\n"
         "OUT ends in .prf. Convert with --profile OUT, or keep it with your own profiles.",
         "gaitwright suggest strange.bvh -o strange.prf"),
-    Row("compare", "SOURCE RESULT", kProfile | kHtml | kForce, kProfile, RunCompare,
+    Row("compare", "SOURCE RESULT", kProfile | kAlign | kHtml | kForce, kProfile, RunCompare,
         "Measure a conversion: how far the result's bones, feet and path differ.\n"
+        "A result of convert --align is measured with --align, which tells the source anew as it was then.\n"
         "--html PAGE writes the figures with curves over time and the worst frames as a page for a browser.",
         "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),
     Row("render", "FILE", kRenderOptions, kOutput, RunRender,

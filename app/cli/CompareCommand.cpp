@@ -6,6 +6,7 @@
 #include "CSceneFile.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
+#include "CheckResult.h"
 #include "Commands.h"
 #include "CompareReport.h"
 #include "ConvertedMotion.h"
@@ -32,32 +33,59 @@ bool LoadResult(const COptions& options, const std::string& path, CMotionFile& m
     return loaded;
 }
 
-bool LoadSource(const COptions& options, const std::string& path, CSceneFile& file)
+// The source as its file has it, or as a conversion with --align reads it.
+class CComparedSource
 {
-    if (!file.LoadWhole(path))
+public:
+    explicit CComparedSource(const COptions& options)
+        : m_kOptions(options), m_kWindow(options), m_kPlatform(EPlatformWriting::No, options.dataFolder),
+          m_kContent(m_kWindow, m_kPlatform)
+    {
+    }
+
+    std::string FindProfile() { return m_kContent.ResolveProfile(m_kOptions.profile); }
+    bool Load(const std::string& profilePath) { return m_kOptions.align ? Align(profilePath) : LoadFile(); }
+    MotionClip Clip();
+
+private:
+    bool Align(const std::string& profilePath);
+    bool LoadFile();
+
+    const COptions& m_kOptions;
+    CShellWindow m_kWindow;
+    CFilePlatform m_kPlatform;
+    CShellContent m_kContent;
+    CSceneFile m_kFile;
+};
+
+bool CComparedSource::Align(const std::string& profilePath)
+{
+    m_kWindow.SetPaths(m_kOptions.files[0], {});
+    m_kContent.SetChoices({true, false});
+    return m_kContent.OpenSource() != 0 && m_kContent.SelectProfile(profilePath) &&
+           m_kContent.ConvertMotion() != 0;
+}
+
+bool CComparedSource::LoadFile()
+{
+    if (!m_kFile.LoadWhole(m_kOptions.files[0]))
         return false;
-    SayWarnings(options, path, file.Record());
+    SayWarnings(m_kOptions, m_kOptions.files[0], m_kFile.Record());
     return true;
 }
 
 // A container moves by its first track, under its first node.
-MotionClip SourceClip(CSceneFile& file)
+MotionClip CComparedSource::Clip()
 {
-    if (!file.IsContainer())
-        return ClipOf(file.Motion());
-    const std::vector<CFoundNode> nodes = file.Nodes();
-    const CKeyframeControl* track = file.FirstTrack();
+    if (m_kOptions.align)
+        return SourceClipOf(m_kContent);
+    if (!m_kFile.IsContainer())
+        return ClipOf(m_kFile.Motion());
+    const std::vector<CFoundNode> nodes = m_kFile.Nodes();
+    const CKeyframeControl* track = m_kFile.FirstTrack();
     if (nodes.empty() || !track)
         return {};
     return {nodes.front().node, track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
-}
-
-std::string FindProfile(const COptions& options)
-{
-    CShellWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
-    return content.ResolveProfile(options.profile);
 }
 
 bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vector<BonePair>& pairs)
@@ -98,13 +126,12 @@ EExit RunCompare(const COptions& options)
         return page;
     if (!HasPageFolder(options))
         return EExit::Failed;
-    CSceneFile source;
+    CComparedSource source(options);
     CMotionFile result;
-    const std::string profilePath = FindProfile(options);
-    if (profilePath.empty() || !LoadSource(options, options.files[0], source) ||
-        !LoadResult(options, options.files[1], result))
+    const std::string profilePath = source.FindProfile();
+    if (profilePath.empty() || !source.Load(profilePath) || !LoadResult(options, options.files[1], result))
         return EExit::Failed;
-    const MotionClip sourceClip = SourceClip(source);
+    const MotionClip sourceClip = source.Clip();
     const MotionClip resultClip = ClipOf(result);
     std::vector<BonePair> pairs;
     if (!Pair(profilePath, sourceClip.root, resultClip.root, pairs))

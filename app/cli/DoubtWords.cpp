@@ -1,7 +1,6 @@
 #include "DoubtWords.h"
 
 #include "CJsonWriter.h"
-#include "CNode.h"
 #include "CReport.h"
 #include "ChooseProfile.h"
 #include "Words.h"
@@ -47,16 +46,11 @@ const DoubtText& TextOf(const ProfileDoubt& doubt)
     return kTexts[static_cast<size_t>(doubt.kind) - 1];
 }
 
-std::string_view NameOf(const CNode* joint)
-{
-    return joint ? joint->NameView() : std::string_view();
-}
-
 std::string Sentence(const ProfileDoubt& doubt)
 {
     const DoubtText& text = TextOf(doubt);
-    const std::string other = text.between ? text.between + Quoted(NameOf(doubt.other)) : "";
-    return text.before + Quoted(NameOf(doubt.joint)) + other + text.behind;
+    const std::string other = text.between ? text.between + Quoted(doubt.other) : "";
+    return text.before + Quoted(doubt.joint) + other + text.behind;
 }
 
 // Bones that come out turned are many where one is: they share a sentence, and few of them are named.
@@ -70,7 +64,7 @@ std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
         if (doubt.kind != EProfileDoubt::Turned)
             continue;
         if (count < kNamed)
-            joints += (count > 0 ? ", " : "") + Quoted(NameOf(doubt.joint));
+            joints += (count > 0 ? ", " : "") + Quoted(doubt.joint);
         ++count;
     }
     if (count == 0)
@@ -130,8 +124,8 @@ void WriteVerdict(CJsonWriter& json, const ProfileVerdict& verdict)
     {
         json.BeginObject();
         json.Key("kind").Text(TextOf(doubt).name);
-        json.Key("joint").Text(NameOf(doubt.joint));
-        json.Key("other").Text(NameOf(doubt.other));
+        json.Key("joint").Text(doubt.joint);
+        json.Key("other").Text(doubt.other);
         json.Key("words").Text(Sentence(doubt));
         json.EndObject();
     }

@@ -51,8 +51,9 @@ public:
     bool SetFixed(CNode* target, bool fixed);
     bool SetShares(CNode* target, const CBoneShares& shares);
 
-    /// Whether a bone that takes the whole of a rotation takes it as it is, also at whole quarter turns, where
-    /// the decomposition of its share gives another one back. Off by the rules; the tables do not change it.
+    /// Whether a bone that takes the whole of a rotation takes it as it is, also at whole quarter turns,
+    /// where the decomposition of its share gives another one back. Off by the rules; the tables do not
+    /// change it.
     void SetPlainTurns(bool plain) { m_bPlainTurns = plain; }
     bool HasPlainTurns() const { return m_bPlainTurns; }
 

@@ -2,6 +2,9 @@
 
 #include "CNode.h"
 
+#include <algorithm>
+#include <vector>
+
 namespace gw {
 
 namespace {
@@ -17,14 +20,43 @@ bool ArePlacedApart(const CNode& a, const CNode& b)
     return Vec3Length(offset) > kSamePlace * (1.0 + Vec3Length(place));
 }
 
-CNode* FirstChild(const CNode& node)
+std::vector<CNode*> ChildrenOf(const CNode& node)
 {
+    std::vector<CNode*> children;
     for (size_t i = 0; i < node.GetChildCount(); ++i)
     {
         if (CNode* const child = RecordCast<CNode>(node.ChildAt(i)))
-            return child;
+            children.push_back(child);
     }
-    return nullptr;
+    return children;
+}
+
+// How many joints go on below one another; more than a finger has are as many as a finger has.
+size_t BranchLength(CNode& top)
+{
+    constexpr size_t kMost = 5;
+    std::vector<CNode*> level{&top};
+    size_t length = 0;
+    for (; !level.empty() && length < kMost; ++length)
+    {
+        std::vector<CNode*> below;
+        for (const CNode* node : level)
+        {
+            const std::vector<CNode*> children = ChildrenOf(*node);
+            below.insert(below.end(), children.begin(), children.end());
+        }
+        level = std::move(below);
+    }
+    return length;
+}
+
+// The first of the longest: a heel that ends at once does not stand for the toes.
+CNode* LongestBranch(const CNode& node)
+{
+    const std::vector<CNode*> children = ChildrenOf(node);
+    if (children.size() < 2)
+        return children.empty() ? nullptr : children.front();
+    return *std::ranges::max_element(children, {}, [](CNode* child) { return BranchLength(*child); });
 }
 
 // The child of a node on the way down to another, or null where that is not below.
@@ -50,7 +82,7 @@ CNode* JointBelow(const CNode& node, CNode* goal)
     for (const CNode* at = &node;;)
     {
         CNode* child = ChildTowards(*at, goal);
-        child = child ? child : FirstChild(*at);
+        child = child ? child : LongestBranch(*at);
         if (!child || ArePlacedApart(node, *child))
             return child;
         at = child;

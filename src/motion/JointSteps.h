@@ -9,8 +9,8 @@ class CNode;
 
 /// The nearest ancestor at another place, or null.
 CNode* JointAbove(const CNode& node);
-/// The nearest joint below at another place, on the way to `goal` where that is below, else along first
-/// children; null where there is none.
+/// The nearest joint below at another place, on the way to `goal` where that is below, else along the
+/// branch that goes on farthest; null where there is none.
 CNode* JointBelow(const CNode& node, CNode* goal);
 
 } // namespace gw

@@ -93,19 +93,19 @@ std::vector<TellingRow> Tellings()
     const Turn standing = Everywhere(zUp);
     const Turn back = Everywhere(TurnAbout(kVec3UnitY, 180.0));
     return {
-        {"a T-pose already", straight, none, 0.1},
-        {"an A-pose", spread, none, 0.1},
-        {"arms that hang", down, none, 0.1},
-        {"a rest pose with Z up", standing, none, 0.1},
-        {"a motion with Z up", standing, zUp, 0.1},
-        {"Z up in the motion alone", straight, zUp, 0.1},
-        {"a rest pose that faces back", back, none, 0.1},
-        {"bones along X", AlongX, none, 12.0},
-        {"bones along X, with Z up", AlongX, zUp, 12.0},
-        {"slanted shins", Slanted, none, 0.1},
-        {"knees that bend to the side", TurnedKnees, none, 2.0},
-        {"a hand rolled at rest", RolledHand, none, 0.1},
-        {"feet that hang at rest", HangingFeet, none, 1.0},
+        {"a T-pose already",            straight,    none, 0.1 },
+        {"an A-pose",                   spread,      none, 0.1 },
+        {"arms that hang",              down,        none, 0.1 },
+        {"a rest pose with Z up",       standing,    none, 0.1 },
+        {"a motion with Z up",          standing,    zUp,  0.1 },
+        {"Z up in the motion alone",    straight,    zUp,  0.1 },
+        {"a rest pose that faces back", back,        none, 0.1 },
+        {"bones along X",               AlongX,      none, 12.0},
+        {"bones along X, with Z up",    AlongX,      zUp,  12.0},
+        {"slanted shins",               Slanted,     none, 0.1 },
+        {"knees that bend to the side", TurnedKnees, none, 2.0 },
+        {"a hand rolled at rest",       RolledHand,  none, 0.1 },
+        {"feet that hang at rest",      HangingFeet, none, 1.0 },
     };
 }
 

@@ -86,7 +86,7 @@ TEST_F(Choose, AHandThatWouldStandAcrossIsTold)
     const std::vector<ProfileChoice> choices = Of(body.Root(), {std::string(kAssets) + "HumanIK02.prf"});
     std::vector<std::string> turned;
     for (const ProfileDoubt& doubt : choices.front().verdict.doubts)
-        turned.emplace_back(doubt.kind == EProfileDoubt::Turned ? doubt.joint->NameView() : "another doubt");
+        turned.emplace_back(doubt.kind == EProfileDoubt::Turned ? doubt.joint : "another doubt");
     EXPECT_THAT(turned, testing::ElementsAre("LeftHand", "RightHand"));
     EXPECT_EQ(choices.front().verdict.sureness, ESureness::Likely);
 }
@@ -255,7 +255,7 @@ TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
         const ProfileChoice choice = Of(*source.motionRoot, {std::string(kAssets) + row.profile}).front();
         EXPECT_TRUE(choice.match.IsWhole());
         for (const ProfileDoubt& doubt : choice.verdict.doubts)
-            EXPECT_FALSE(IsOfRoles(doubt.kind)) << doubt.joint->NameView();
+            EXPECT_FALSE(IsOfRoles(doubt.kind)) << doubt.joint;
     }
 }
 

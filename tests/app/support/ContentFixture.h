@@ -81,7 +81,7 @@ public:
     std::map<int, EAnswer> m_kAnswers; ///< by message; all others are answered with OK
     std::set<EKey> m_kKeys;
     std::function<void(const std::string& path)>
-        m_kOnBatchFile; ///< what happens while a batch takes up a file
+        m_kOnBatchFile;                     ///< what happens while a batch takes up a file
     std::function<void()> m_kOnBox = [] {}; ///< what else happens while a message box is open
     std::function<void(bool shown)> m_kOnShowEditor = [](bool) {};
     std::function<void()> m_kOnRefreshEditor = [] {};
