@@ -19,6 +19,7 @@ LegJoints SourceLeg(CNode& ankle, CNode* toe, const LegJoints& result, const CSo
     CNode* const mappedKnee = sources.SourceOf(result.knee);
     CNode* const knee = mappedKnee ? mappedKnee : JointAbove(ankle);
     CNode* const mappedThigh = sources.SourceOf(result.thigh);
+    toe = knee ? ToeFrom(toe, *knee, ankle) : toe;
     if (mappedThigh || !knee)
         return {mappedThigh, knee, &ankle, toe};
     return {JointAbove(*knee), knee, &ankle, toe};

@@ -55,7 +55,8 @@ std::optional<CFaithfulLeg> CFaithfulLeg::Plan(const CRetargeter& retargeter, co
                      retargeter.SourceOf(target.ankle)};
     if (!IsWhole(source) || source.thigh == source.knee || source.knee == source.ankle)
         return std::nullopt;
-    source.toe = JointBelow(*source.ankle, retargeter.SourceOf(target.toe));
+    source.toe =
+        ToeFrom(JointBelow(*source.ankle, retargeter.SourceOf(target.toe)), *source.knee, *source.ankle);
     return CFaithfulLeg(matcher, source, target, restFloor);
 }
 

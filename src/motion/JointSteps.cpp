@@ -12,6 +12,8 @@ namespace {
 // Joints no farther apart than this, by how far from the origin they are, are at the same place: rounding is
 // a tenth of it, and the shortest bones are a thousand times longer.
 constexpr double kSamePlace = 1e-6;
+// Of a shin, what the bones of an ankle take up at most; the ball of a foot lies at a quarter.
+constexpr double kAnkleShare = 0.05;
 
 bool ArePlacedApart(const CNode& a, const CNode& b)
 {
@@ -68,6 +70,16 @@ CNode* ChildTowards(const CNode& node, CNode* below)
 }
 
 } // namespace
+
+CNode* ToeFrom(CNode* first, const CNode& knee, const CNode& ankle)
+{
+    const Vec3 place = ankle.m_kWorldMatrix.Translation();
+    const double least = kAnkleShare * Vec3Length(knee.m_kWorldMatrix.Translation() - place);
+    CNode* toe = first;
+    while (toe && Vec3Length(toe->m_kWorldMatrix.Translation() - place) < least)
+        toe = JointBelow(*toe, nullptr);
+    return toe ? toe : first;
+}
 
 CNode* JointAbove(const CNode& node)
 {

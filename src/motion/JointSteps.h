@@ -12,5 +12,8 @@ CNode* JointAbove(const CNode& node);
 /// The nearest joint below at another place, on the way to `goal` where that is below, else along the
 /// branch that goes on farthest; null where there is none.
 CNode* JointBelow(const CNode& node, CNode* goal);
+/// The joint that a foot leads to: `first`, a joint below the ankle, or where that still lies in the ankle
+/// the next one along the branch that does not. Null for null.
+CNode* ToeFrom(CNode* first, const CNode& knee, const CNode& ankle);
 
 } // namespace gw

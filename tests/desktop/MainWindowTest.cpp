@@ -70,7 +70,8 @@ std::string NamelessWalk(const std::string& folder)
     {
         const size_t name = std::min(line.find("ROOT "), line.find("JOINT "));
         if (name != line.npos)
-            line = line.substr(0, line.find(' ', name)) + " piece" + std::to_string(number++);
+            line.replace(line.find(' ', name), line.npos,
+                         std::string(" piece").append(std::to_string(number++)));
         text += line + '\n';
     }
     WriteBytes(folder + "nameless.bvh", text);
