@@ -2,8 +2,8 @@
 
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
+#include "CPrivateFile.h"
 #include "CProfileEditorDialog.h"
-#include "CSafeFile.h"
 #include "CWaitCursor.h"
 #include "FailureWords.h"
 #include "Packaging.h"
@@ -52,14 +52,11 @@ bool CGaitConvertContent::WriteResult(const std::string& path)
 // as it is.
 bool CGaitConvertContent::WritePackage(const std::string& path)
 {
-    const std::string motionPath = CreatePrivateFile(path, kMotionExtension);
-    if (motionPath.empty())
+    const CPrivateFile motion(path, kMotionExtension);
+    if (motion.Path().empty())
         return m_kWriteRecord.Fail(EFailure::WriteError);
-    const bool packaged =
-        SaveMotion(motionPath, kSavedRate) &&
-        PackageMotion(motionPath, path, static_cast<float>(ProfileRate()), kHostRate, m_kWriteRecord);
-    DeleteFile(motionPath);
-    return packaged;
+    return SaveMotion(motion.Path(), kSavedRate) &&
+           PackageMotion(motion.Path(), path, static_cast<float>(ProfileRate()), kHostRate, m_kWriteRecord);
 }
 
 // Writes the result with as many times more frames as a rate stands above the profile's.

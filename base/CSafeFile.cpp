@@ -1,12 +1,10 @@
 #include "CSafeFile.h"
 
+#include "CPrivateFile.h"
 #include "Paths.h"
 
 #include <cerrno>
-#include <cstdint>
-#include <cstdio>
 #include <filesystem>
-#include <random>
 #include <system_error>
 #include <utility>
 
@@ -39,38 +37,6 @@ std::string FollowLinks(const std::string& path)
     return {};
 }
 
-std::string FolderOf(const std::string& path)
-{
-    return path.substr(0, path.rfind(kPathSeparator) + 1); // npos + 1 is 0
-}
-
-// A name that does not tell the destination's, so that a long one stays within the system's limit.
-std::string PrivateName(const std::string& folder, std::string_view extension)
-{
-    std::random_device random;
-    char name[32];
-    std::snprintf(name, sizeof name, ".gaitwright-%08x%08x", random(), random());
-    return folder + name + std::string(extension);
-}
-
-// Creates a file that nobody else has, in a folder with a separator at its end. Below 0 where the folder
-// takes none.
-int CreateUnique(const std::string& folder, std::string_view extension, unsigned mode, std::string& path)
-{
-    constexpr int kAttempts = 16; // names are 64 random bits: a second attempt is all but unheard of
-    for (int i = 0; i < kAttempts; ++i)
-    {
-        path = PrivateName(folder, extension);
-        const int file = open(path.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, mode);
-        if (file >= 0)
-            return file;
-        if (errno != EEXIST)
-            break;
-    }
-    path.clear();
-    return -1;
-}
-
 // Whether a path is free or holds a file that may be replaced. `mode` becomes the file's, or 0 where the path
 // is free.
 bool MayReplace(const std::string& path, unsigned& mode)
@@ -99,7 +65,7 @@ bool CSafeFile::Open(const std::string& path)
         return false;
     // A file that others may not read is not laid open while it is written.
     const unsigned mode = m_uiMode ? m_uiMode : kModeOfNew;
-    m_iFile = CreateUnique(folder, kPrivateExtension, mode, m_kPrivatePath);
+    m_iFile = CreatePrivateFile(folder, kPrivateExtension, mode, m_kPrivatePath);
     return m_iFile >= 0;
 }
 
@@ -145,15 +111,6 @@ void CSafeFile::Discard()
     m_kPath.clear();
     m_uiMode = 0;
     m_bFailed = false;
-}
-
-std::string CreatePrivateFile(const std::string& besidePath, std::string_view extension)
-{
-    std::string path;
-    const int file = CreateUnique(FolderOf(besidePath), extension, kModeOfNew, path);
-    if (file >= 0)
-        close(file);
-    return path;
 }
 
 } // namespace gw

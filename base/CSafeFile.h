@@ -39,8 +39,4 @@ private:
     bool m_bFailed = false;
 };
 
-/// A private file name beside a path, for intermediate files: same folder, same extension, not existing.
-/// Empty when the folder takes no file. The file is created empty.
-std::string CreatePrivateFile(const std::string& besidePath, std::string_view extension);
-
 } // namespace gw

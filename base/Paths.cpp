@@ -1,11 +1,14 @@
 #include "Paths.h"
 
+#include "PrivateNames.h"
 #include "Text.h"
 
 #include <algorithm>
 #include <filesystem>
+#include <memory>
 #include <system_error>
 
+#include <dirent.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -26,6 +29,12 @@ std::string TextOf(const fs::path& path)
 {
     const std::u8string text = path.u8string();
     return {text.begin(), text.end()};
+}
+
+bool IsRegular(const std::string& path)
+{
+    struct stat status;
+    return stat(path.c_str(), &status) == 0 && S_ISREG(status.st_mode);
 }
 
 } // namespace
@@ -63,6 +72,14 @@ bool FolderExists(const std::string& path)
     return fs::is_directory(NativePath(path), error);
 }
 
+bool IsFolderItself(const std::string& path)
+{
+    // A separator at the end would follow a link.
+    const std::string bare = path.substr(0, path.find_last_not_of(kPathSeparator) + 1);
+    struct stat status;
+    return lstat(bare.c_str(), &status) == 0 && S_ISDIR(status.st_mode);
+}
+
 bool FileSize(const std::string& path, uint64_t& byteCount)
 {
     const fs::path native = NativePath(path);
@@ -98,18 +115,28 @@ bool DeleteFile(const std::string& path)
     return FileExists(path) && fs::remove(NativePath(path), error);
 }
 
-std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension)
+std::string FolderOf(const std::string& path)
+{
+    return path.substr(0, path.rfind(kPathSeparator) + 1); // npos + 1 is 0
+}
+
+// Not by the library's iterator, which ends the program where there is no memory for a path.
+std::vector<std::string> NamesInFolder(const std::string& folder)
 {
     std::vector<std::string> names;
-    std::error_code error;
-    fs::directory_iterator entry(NativePath(folder), error);
-    for (; !error && entry != fs::directory_iterator(); entry.increment(error))
-    {
-        std::error_code unreadable;
-        std::string name = TextOf(entry->path().filename());
-        if (HasExtension(name, extension) && entry->is_regular_file(unreadable))
-            names.push_back(std::move(name));
-    }
+    const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(folder.c_str()), closedir);
+    while (const dirent* entry = directory ? readdir(directory.get()) : nullptr)
+        names.emplace_back(entry->d_name);
+    return names;
+}
+
+std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension)
+{
+    std::vector<std::string> names = NamesInFolder(folder);
+    std::erase_if(names, [&](const std::string& name) {
+        return !HasExtension(name, extension) || IsPrivateName(name) ||
+               !IsRegular(WithSeparator(folder) + name);
+    });
     std::ranges::sort(names);
     return names;
 }

@@ -31,6 +31,8 @@ std::string WithSeparator(std::string folder);
 /// Paths are UTF-8. An error of the file system counts as "no".
 bool FileExists(const std::string& path);
 bool FolderExists(const std::string& path);
+/// Whether a folder stands under a path itself, and no link that leads to one.
+bool IsFolderItself(const std::string& path);
 /// The size of a regular file in bytes; false when there is none or it cannot be examined.
 bool FileSize(const std::string& path, uint64_t& byteCount);
 /// Whether a file is there and read-only: no write bit in its mode, or not writable by the user.
@@ -39,8 +41,13 @@ bool IsReadOnly(const std::string& path);
 bool CreateFolder(const std::string& path);
 bool DeleteFile(const std::string& path);
 
+/// The folder of a path with its separator; empty where none stands in it. Unlike in SplitPath, only the
+/// platform's separator counts, as it does for the system.
+std::string FolderOf(const std::string& path);
+/// The names of all that is in a folder, in no order; none where it cannot be read.
+std::vector<std::string> NamesInFolder(const std::string& folder);
 /// The names of the regular files in a folder whose extension (dot included) fits without regard to case, in
-/// name order, so that a run is the same everywhere.
+/// name order, so that a run is the same everywhere. Private files are passed over.
 std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
 
 /// The folder of the running program with its trailing separator.

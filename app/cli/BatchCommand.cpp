@@ -5,6 +5,7 @@
 #include "CShellWindow.h"
 #include "Commands.h"
 #include "Paths.h"
+#include "PrivateNames.h"
 #include "ProfileFit.h"
 #include "ReportJson.h"
 #include "Text.h"
@@ -68,6 +69,7 @@ EExit RunBatchFolder(const COptions& options)
         SayError(Printable(folder) + ": there is no such folder");
         return EExit::Failed;
     }
+    RemoveLeftovers(folder);
     const char* extension = options.job == "htr" ? ".bvh" : ".htr";
     const std::vector<std::string> names = FilesInFolder(folder, extension);
     if (names.empty())

@@ -5,6 +5,7 @@
 #include "Output.h"
 #include "PageOutput.h"
 #include "Paths.h"
+#include "PrivateNames.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -158,6 +159,8 @@ bool PrepareFolders(const COptions& options)
         SayError(Printable(options.outputFolder) + ": the folder cannot be made");
         return false;
     }
+    if (!options.outputFolder.empty())
+        RemoveLeftovers(options.outputFolder);
     return HasPageFolder(options);
 }
 

@@ -3,6 +3,7 @@
 #include "CCustomData.h"
 #include "CMotionFile.h"
 #include "COrrinStream.h"
+#include "CPrivateFile.h"
 #include "CSafeFile.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
@@ -19,12 +20,10 @@ bool LoadBytes(std::span<const std::byte> bytes, const char* extension, CMotionF
 {
     std::error_code error;
     const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    const std::string path = CreatePrivateFile(folder, extension);
+    const CPrivateFile inner(folder, extension);
     CSafeFile file;
-    const bool loaded =
-        !path.empty() && file.Open(path) && file.Write(bytes) && file.Commit() && motion.Load(path);
-    DeleteFile(path);
-    return loaded;
+    return !inner.Path().empty() && file.Open(inner.Path()) && file.Write(bytes) && file.Commit() &&
+           motion.Load(inner.Path());
 }
 
 } // namespace

@@ -14,11 +14,12 @@ namespace {
 
 // Readers and writers bound what they take by the size of the file, so that only a machine that has less gets
 // here.
-EExit RunCommand(const CArguments& arguments)
+EExit RunArguments(int argc, char** argv)
 {
     try
     {
-        return arguments.command->run(arguments.options);
+        const CArguments arguments = ParseArguments(argc, argv);
+        return arguments.command ? arguments.command->run(arguments.options) : arguments.exit;
     } catch (const std::bad_alloc&)
     {
         SayError("there is not enough memory for this");
@@ -35,8 +36,7 @@ int RunProgram(int argc, char** argv)
     // program and leave half a file.
     std::signal(SIGXFSZ, SIG_IGN);
 #endif
-    const CArguments arguments = ParseArguments(argc, argv);
-    EExit exit = arguments.command ? RunCommand(arguments) : arguments.exit;
+    EExit exit = RunArguments(argc, argv);
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {
         SayError("standard output cannot be written");

@@ -16,11 +16,13 @@ namespace {
 constexpr std::string_view kNamePattern = "TK_XXXXXX.tmp";
 constexpr int kExtensionLength = 4;
 
-// Everybody on a machine may share the folder, as they share the one that it lies in.
-void MakeSharedFolder(const std::string& folder)
+// Everybody on a machine may share the folder, as they share the one that it lies in. False where another one
+// has put a link or a file in its place.
+bool MakeSharedFolder(const std::string& folder)
 {
     if (!FolderExists(folder) && CreateFolder(folder))
         chmod(folder.c_str(), 01777);
+    return IsFolderItself(folder);
 }
 
 // Another program may remove the empty folder just before a file is made in it.
@@ -29,7 +31,8 @@ int CreateIn(const std::string& folder, std::string& path)
     constexpr int kAttempts = 8;
     for (int i = 0; i < kAttempts; ++i)
     {
-        MakeSharedFolder(folder);
+        if (!MakeSharedFolder(folder))
+            break;
         path = folder + std::string(kNamePattern);
         const int file = mkostemps(path.data(), kExtensionLength, O_CLOEXEC);
         if (file >= 0)

@@ -134,6 +134,8 @@ void CTempStore::Unmap(uint32_t handle)
 
 void CTempStore::Purge(const std::string& folder)
 {
+    if (!IsFolderItself(folder))
+        return;
     for (const std::string& name : FilesInFolder(folder, ".tmp"))
         DeleteFile(WithSeparator(folder) + name);
     rmdir(folder.c_str());

@@ -1,6 +1,8 @@
 #include "CMappedFile.h"
+#include "CPrivateFile.h"
 #include "CSafeFile.h"
 #include "Paths.h"
+#include "PrivateNames.h"
 #include "TempFolder.h"
 
 #include <algorithm>
@@ -329,16 +331,43 @@ TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
 TEST(CSafeFile, PrivateFilesLieBesideAndDiffer)
 {
     const CTempFolder folder;
-    const std::string first = CreatePrivateFile(folder.Path("walk.htr"), ".htr");
-    const std::string second = CreatePrivateFile(folder.Path("walk.htr"), ".htr");
-    EXPECT_NE(first, second);
-    for (const std::string& path : {first, second})
     {
-        EXPECT_EQ(SplitPath(path).folder, folder.Path());
-        EXPECT_TRUE(HasExtension(path, ".htr"));
-        EXPECT_EQ(ReadBytes(path), "");
+        const CPrivateFile first(folder.Path("walk.htr"), ".htr");
+        const CPrivateFile second(folder.Path("walk.htr"), ".htr");
+        EXPECT_NE(first.Path(), second.Path());
+        for (const std::string& path : {first.Path(), second.Path()})
+        {
+            EXPECT_EQ(SplitPath(path).folder, folder.Path());
+            EXPECT_TRUE(HasExtension(path, ".htr"));
+            EXPECT_EQ(ReadBytes(path), "");
+            EXPECT_EQ(ModeOf(path), 0600u) << "for nobody else's eyes";
+        }
+        EXPECT_TRUE(FilesInFolder(folder.Path(), ".htr").empty()) << "nobody takes one for a motion";
+        EXPECT_EQ(CPrivateFile(folder.Path("none/walk.htr"), ".htr").Path(), "");
     }
-    EXPECT_EQ(CreatePrivateFile(folder.Path("none/walk.htr"), ".htr"), "");
+    EXPECT_EQ(EntryCount(folder), 0u);
+}
+
+TEST(PrivateNames, OnlyWhatADeadProgramLeftIsRemoved)
+{
+    const CTempFolder folder;
+    const std::string own = PrivateName(folder.Path(), ".tmp");
+    std::string left = own;
+    const pid_t child = fork();
+    if (child == 0)
+        _exit(0);
+    waitpid(child, nullptr, 0);
+    char number[16];
+    std::snprintf(number, sizeof number, "-%08x-", static_cast<unsigned>(child));
+    left.replace(left.size() - 22, 10, number);
+    std::string foreign = left;
+    foreign[foreign.size() - 23] = foreign[foreign.size() - 23] == '0' ? '1' : '0'; // of another machine
+    for (const std::string& path :
+         {own, left, foreign, folder.Path(".gaitwright-notes"), folder.Path("a.tmp")})
+        WriteBytes(path, "x");
+    RemoveLeftovers(folder.Path());
+    EXPECT_FALSE(FileExists(left));
+    EXPECT_EQ(EntryCount(folder), 4u);
 }
 
 } // namespace gw

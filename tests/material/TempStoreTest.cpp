@@ -3,6 +3,7 @@
 #include "Paths.h"
 #include "TempFolder.h"
 
+#include <filesystem>
 #include <gtest/gtest.h>
 
 #include <csignal>
@@ -213,6 +214,18 @@ TEST_F(TempStore, APurgeTakesWhatACrashLeft)
     DeleteFile(m_kFolder.Path("old/keep.txt"));
     CTempStore::Purge(m_kFolder.Path("old"));
     EXPECT_FALSE(FolderExists(m_kFolder.Path("old")));
+}
+
+// Everybody may make a link in the folder for temporary files.
+TEST_F(TempStore, ALinkToAFolderOfSomebodyIsLeftAlone)
+{
+    CreateFolder(m_kFolder.Path("home"));
+    WriteBytes(m_kFolder.Path("home/mine.tmp"), "x");
+    std::filesystem::create_symlink(m_kFolder.Path("home"), m_kFolder.Path("TKTmp"));
+    CTempStore store(m_kFolder.Path("TKTmp/"));
+    EXPECT_EQ(store.Allocate(1), 0u);
+    CTempStore::Purge(m_kFolder.Path("TKTmp"));
+    EXPECT_TRUE(FileExists(m_kFolder.Path("home/mine.tmp")));
 }
 
 TEST_F(TempStore, TheFirstFileTakesAwayWhatACrashLeftAndHarmsNobodyAlive)
