@@ -69,6 +69,12 @@ bool CGaitConvertContent::PrepareRetargeter()
     const bool ready = m_pkProfile && m_pkProfile->ApplyProfile(&retargeter, nullptr, nullptr) &&
                        m_pkProfile->HasRootMapping() &&
                        retargeter.SourceOf(FindBone(m_kResultMotion.motionRoot.Get(), kRootBone));
+    const CFailure& shares = retargeter.Record().Failure(); // all that can have failed up to here
+    if (shares)
+    {
+        Report(shares.name, retargeter.Record());
+        return false;
+    }
     if (!ready)
         ReportMisfit();
     return ready;

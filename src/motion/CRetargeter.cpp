@@ -2,6 +2,7 @@
 
 #include "CMappedFile.h"
 #include "Numbers.h"
+#include "Paths.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -91,7 +92,11 @@ void CRetargeter::ClearMaps()
 bool CRetargeter::LoadShares(const std::string& path)
 {
     CMappedFile file;
-    if (path.empty() || file.Open(path) != EFailure::None)
+    const EFailure failure = file.Open(path);
+    // A skeleton need not have the file; one that is there and cannot be read would be missed in the result.
+    if (failure != EFailure::None && FileExists(path))
+        return m_kRecord.Fail(failure, 0, path);
+    if (failure != EFailure::None)
         return false;
     std::string_view rest = SkipByteOrderMark(file.Text());
     CBoneShares shares;

@@ -41,7 +41,8 @@ public:
     void SetScenes(CNode* sourceRoot, CNode* targetRoot);
     /// Empties all tables but the shares.
     void ClearMaps();
-    /// Reads the share file of the target skeleton. False when it cannot be opened.
+    /// Reads the share file of the target skeleton. False when it cannot be opened; where it is there all the
+    /// same, the record tells why.
     bool LoadShares(const std::string& path);
 
     // Each replaces the entry of a key that is there and answers true.
