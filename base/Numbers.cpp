@@ -97,12 +97,12 @@ inline const char* ReadPlain(const char* text, const char* end, double& value)
 
 int64_t ReadExponent(std::string_view text)
 {
-    constexpr int64_t kEndless = int64_t{1} << 50;
+    constexpr int64_t kEndless = int64_t{1} << 50; // so that the digits of any text can be added
     const char* const end = text.data() + text.size();
     int64_t exponent = 0;
     if (std::from_chars(SkipPlus(text.data(), end), end, exponent).ec == std::errc::result_out_of_range)
         return text.front() == '-' ? -kEndless : kEndless;
-    return exponent;
+    return std::clamp(exponent, -kEndless, kEndless);
 }
 
 // from_chars does not say on which side a number leaves the range: the place of its first digit not 0 does.

@@ -63,6 +63,8 @@ TEST(IniText, SettingKeepsEveryOtherLine)
         {"appended",      "[Settings]\nJ=1 ; c\n\n[B]\nK=2", "v",       "[Settings]\nJ=1 ; c\nK=v\n\n[B]\nK=2"},
         {"a new section", "[B]\nK=2",                        "v",       "[B]\nK=2\n\n[Settings]\nK=v\n"       },
         {"quoted",        "",                                "0,1;=",   "[Settings]\nK=\"0,1;=\"\n"           },
+        {"open quotes",   "[B]\nK=\"2",                      "v",       "[B]\nK=\"2\"\n\n[Settings]\nK=v\n"   },
+        {"a backslash",   "[Settings]\n\\",                  "v",       "[Settings]\n\\\n\nK=v"               },
         {"escaped",       "",                                "@C:\\\"", "[Settings]\nK=@@C:\\\\\\\"\n"        },
     };
     for (const auto& row : rows)
