@@ -6,6 +6,7 @@
 #   ./build.sh test         builds and runs all tests
 #   ./build.sh asan         the same tests under AddressSanitizer and UndefinedBehaviorSanitizer
 #   ./build.sh bench        runs the benchmarks: ratios within one run
+#   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
 #   ./build.sh lint         checks formatting and runs the linter
 set -euo pipefail
 cd "$(dirname "$0")"
@@ -18,6 +19,7 @@ packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-
 packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon)
 packages_bench=(libbenchmark-dev libassimp-dev python3 time)
 packages_lint=(clang-format clang-tidy)
+packages_fuzz=(clang libclang-rt-14-dev python3)
 
 need() {
   local missing=()
@@ -61,6 +63,37 @@ demo() {
   "$bin/gaitwright" info "$out/walk.Kinetra"
 }
 
+# run_fuzzer NAME SECONDS: from the seeds, from what once broke something and from what earlier runs found. A
+# finding stays in build/fuzz/findings; its text says which promise is broken.
+run_fuzzer() {
+  local found=build/fuzz/found/$1 findings=build/fuzz/findings/$1 log=build/fuzz/log/$1
+  mkdir -p "$found" "$findings" build/fuzz/log
+  local inputs=("$found" "build/fuzz/fuzz/corpus/$1")
+  [ -d "fuzz/regressions/$1" ] && inputs+=("fuzz/regressions/$1")
+  local options=(-timeout=5 -max_len=65536 -rss_limit_mb=2560 -print_final_stats=1 "-artifact_prefix=$findings/")
+  if "build/fuzz/bin/fuzz_$1" "${options[@]}" -max_total_time="$2" -close_fd_mask=3 "-dict=fuzz/dictionaries/$1.dict" \
+    "${inputs[@]}" >"$log" 2>&1; then
+    echo "$1: $(sed -n 's/^stat::number_of_executed_units: *//p' "$log") inputs, nothing found"
+    return 0
+  fi
+  echo "$1: broken by"
+  find "$findings" -type f -newer build/fuzz/begun -print -exec "build/fuzz/bin/fuzz_$1" {} \; 2>&1 | head -n 40
+  return 1
+}
+
+# In memory where there is a file system in memory: each input is a file.
+fuzz() {
+  local name failed=0
+  fuzz_folder=$(mktemp -d -p "$([ -d /dev/shm ] && echo /dev/shm || echo /tmp)") # not local, for the trap
+  trap 'rm -rf "$fuzz_folder"' EXIT
+  export TMPDIR=$fuzz_folder
+  touch build/fuzz/begun
+  for name in fuzz/dictionaries/*.dict; do
+    run_fuzzer "$(basename "$name" .dict)" "$1" || failed=1
+  done
+  return $failed
+}
+
 case "${1:-}" in
 build)
   prepare
@@ -88,6 +121,11 @@ bench)
   build/release/bin/gaitwright_bench
   python3 bench/whole_process.py build/release/bin
   ;;
+fuzz)
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_fuzz[@]}"
+  build fuzz
+  fuzz "${2:-60}"
+  ;;
 lint)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
   git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
@@ -95,7 +133,7 @@ lint)
   git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
   ;;
 *)
-  sed -n '4,9s/^# *//p' "$0"
+  sed -n '4,10s/^# *//p' "$0"
   exit 2
   ;;
 esac

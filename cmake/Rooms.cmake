@@ -23,6 +23,10 @@ function(gw_compile_options target)
                                              -fno-omit-frame-pointer -D_GLIBCXX_ASSERTIONS)
     target_link_options(${target} PRIVATE -fsanitize=address,undefined)
   endif()
+  if(GAITWRIGHT_FUZZ)
+    # What a fuzzer steers by.
+    target_compile_options(${target} PRIVATE -fsanitize=fuzzer-no-link)
+  endif()
 endfunction()
 
 # gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the present folder.

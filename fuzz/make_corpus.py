@@ -1,0 +1,117 @@
+"""Makes the seeds of the fuzz targets: small files of every kind, which mutations begin from.
+
+    make_corpus.py PROJECT_FOLDER CORPUS_FOLDER"""
+import struct
+import sys
+from pathlib import Path
+
+from scene_seeds import scenes
+
+PROJECT, CORPUS = Path(sys.argv[1]), Path(sys.argv[2])
+sys.path.insert(0, str(PROJECT / "tests" / "cli"))
+import made  # noqa: E402: small motions that the tests make too
+
+
+def short_motion(path, frames):
+    """The first frames of a motion, so that a mutation costs little."""
+    lines = path.read_text().splitlines()
+    rows = next(i for i, line in enumerate(lines) if line.startswith("Frames:"))
+    kept = lines[:rows] + ["Frames: %d" % frames] + lines[rows + 1:rows + 2 + frames]
+    return "\n".join(kept) + "\n"
+
+
+def bmp(depth, width=5, height=4, palette=0, header=40):
+    """Rows of a depth; below 0 a height stands for rows from the top."""
+    offset = 14 + header + 4 * palette
+    stride = (width * depth + 31) // 32 * 4
+    head = struct.pack("<IiiHHIIiiII", header, width, height, 1, depth, 0, 0, 2835, 2835, palette, 0)
+    colors = b"".join(struct.pack("<I", 0x123456 * i & 0xffffff) for i in range(palette))
+    rows = bytes(i * 37 & 0xff for i in range(stride * abs(height)))
+    file_head = b"BM" + struct.pack("<IHHI", offset + len(rows), 0, 0, offset)
+    return file_head + head + bytes(header - 40) + colors + rows
+
+
+def gif(width=4, height=4, interlaced=False, images=1, local=False, control=True):
+    """Each pixel is a code of its own behind a clear code, so that no table is needed."""
+    palette = bytes(range(12))
+    bits, held, count = 0, 0, b""
+    for code in [4] + [c for i in range(width * height) for c in (i % 4, 4)] + [5]:
+        bits |= code << held
+        held += 3
+    packed = bits.to_bytes((held + 7) // 8, "little")
+    for start in range(0, len(packed), 255):
+        piece = packed[start:start + 255]
+        count += bytes([len(piece)]) + piece
+    flags = (0x81 if local else 0) | (0x40 if interlaced else 0)
+    image = b"," + struct.pack("<4HB", 0, 0, width, height, flags) + (palette if local else b"") + b"\2" + count + b"\0"
+    extension = b"!\xf9\4\5\7\0\1\0" if control else b""
+    return b"GIF89a" + struct.pack("<HHBBB", width, height, 0x81, 0, 0) + palette + (extension + image) * images + b";"
+
+
+def directory(entries):
+    return bytes(14) + struct.pack("<H", len(entries)) + b"".join(struct.pack("<II", *entry) for entry in entries)
+
+
+def library(optional=0x20b):
+    """A library with one block of texts, 128 to 143, in one language."""
+    words = [""] * 10 + ["Invalid file %s.", "*"] + [""] * 4
+    block = b"".join(struct.pack("<H", len(w)) + w.encode("utf-16-le") for w in words)
+    deeper = 1 << 31
+    section = directory([(6, deeper | 24)]) + directory([(9, deeper | 48)]) + directory([(1031, 72)])
+    section += struct.pack("<IIII", 0x1000 + 88, len(block), 0, 0) + block
+    directories = 112 if optional == 0x20b else 96
+    header = struct.pack("<H", optional).ljust(directories - 4, b"\0") + struct.pack("<I", 16)
+    header += bytes(16) + struct.pack("<II", 0x1000, len(section)) + bytes(13 * 8)
+    made_bytes = b"MZ".ljust(0x3c, b"\0") + struct.pack("<I", 0x40)
+    made_bytes += b"PE\0\0" + struct.pack("<HHIIIHH", 0x8664, 1, 0, 0, 0, len(header), 0) + header
+    made_bytes += struct.pack("<8sIIIIIIHHI", b".rsrc", len(section), 0x1000, len(section), 0x200, 0, 0, 0, 0, 0)
+    return made_bytes.ljust(0x200, b"\0") + section
+
+
+def motions():
+    walk = short_motion(PROJECT / "examples" / "walk.bvh", 2)
+    wave = short_motion(PROJECT / "examples" / "wave.bvh", 2)
+    yield "bvh", {"small": made.BVH, "walk": walk, "wave": wave,
+                  "commas": made.bvh("1 90 0 0", "1, 90.5 ,-0 0"), "crlf": made.BVH.replace("\n", "\r\n"),
+                  "endless": made.bvh("    End Site\n    {\n      OFFSET 0 5 0\n    }\n", "")}
+    yield "htr", {"small": made.HTR, "radians": made.htr("RotationUnits Degrees", "RotationUnits Radians"),
+                  "order": made.htr("EulerRotationOrder ZYX", "EulerRotationOrder XYZ")}
+    yield "cha", {"small": made.CHA}
+    yield "chb", {"small": made.chb(), "old": made.chb(100)}
+    ways = {"plain": 0, "packaged": 2, "feet": 4, "all": 2 | 8 | 16 | 32 | 64}
+    converts = {"walk-" + what: bytes([way]) + walk.encode() for what, way in ways.items()}
+    converts["scene"] = b"\1" + made.one_bone_scene()
+    converts["small"] = b"\0" + made.BVH.encode()
+    yield "convert", converts
+
+
+def maps():
+    stock = (PROJECT / "assets" / "PoserBVH.prf").read_text()
+    rows = {"stock": stock, "small": made.profile("Mine", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")]),
+            "fixed": "Name\n* Pelvis . .1,2,3\nPosition 1 -2 3.5\nFrameRate 30\n"}
+    yield "profile", rows
+    yield "maplines", rows
+    yield "shares", {"stock": (PROJECT / "assets" / "KsBone.bsm").read_bytes(), "small": "LThigh 0.5 1 2\nNobody 1 2 3\n"}
+    yield "settings", {"small": "[Settings]\nLastFolder=/home\n\n[General]\nx=1\n",
+                       "odd": '; note\n[Settings]\nLastFolder="a, b;\\x41\\n" ; tail\nk%20y=1,2, 3\n[%General]\n'}
+
+
+def pictures():
+    yield "bmp", {"%d" % depth: bmp(depth, palette=1 << depth if depth <= 8 else 0) for depth in (1, 4, 8, 16, 24, 32)} | {
+        "top": bmp(24, height=-4), "large-head": bmp(8, palette=256, header=124)}
+    yield "gif", {"plain": gif(), "interlaced": gif(interlaced=True), "film": gif(images=3), "local": gif(local=True),
+                  "bare": gif(control=False), "wide": gif(20, 20)}
+    yield "strings", {"64": library(), "32": library(0x10b)}
+
+
+def main():
+    kinds = [*motions(), *maps(), *pictures(), ("container", dict(scenes()))]
+    for target, seeds in kinds:
+        folder = CORPUS / target
+        folder.mkdir(parents=True, exist_ok=True)
+        for name, content in seeds.items():
+            (folder / name).write_bytes(content if isinstance(content, bytes) else content.encode())
+
+
+if __name__ == "__main__":
+    main()

@@ -1,0 +1,11 @@
+// Every row of a BMP file in both forms, and a copy that has the same pixels.
+
+#include "FuzzTarget.h"
+#include "PicturePromises.h"
+
+void gw::FuzzOne(std::span<const std::byte> input)
+{
+    const auto picture = OpenPicture(ScratchFile("in.bmp", input), "r");
+    if (picture && ReadsWhole(*picture))
+        RequireSameCopy(*picture, ScratchPath("out.bmp"));
+}

@@ -1,0 +1,16 @@
+// A motion that could be read is written as one of its own kind and read again.
+
+#include "FuzzTarget.h"
+#include "MotionPromises.h"
+#include "TKBVHStream.h"
+
+void gw::FuzzOne(std::span<const std::byte> input)
+{
+    CMotionFile motion;
+    if (!motion.Load(ScratchFile("in.bvh", input)))
+        return;
+    RequireSoundMotion(motion);
+    TKBVHStream writer(motion);
+    Require(writer.WriteFile(ScratchPath("out.bvh")), "what was read can be written");
+    RequireSameBones(motion, "out.bvh");
+}

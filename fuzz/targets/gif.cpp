@@ -1,0 +1,12 @@
+// Every image of a GIF file, up to the first that is damaged.
+
+#include "FuzzTarget.h"
+#include "PicturePromises.h"
+
+void gw::FuzzOne(std::span<const std::byte> input)
+{
+    const auto picture = OpenPicture(ScratchFile("in.gif", input), "r");
+    while (picture && ReadsWhole(*picture) && picture->NextPicture())
+    {
+    }
+}

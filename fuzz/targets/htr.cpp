@@ -1,0 +1,15 @@
+// A motion with its rest pose, written as one of its own kind and read again.
+
+#include "FuzzTarget.h"
+#include "MotionPromises.h"
+
+void gw::FuzzOne(std::span<const std::byte> input)
+{
+    CMotionFile motion;
+    if (!motion.Load(ScratchFile("in.htr", input)))
+        return;
+    RequireSoundMotion(motion);
+    Require(motion.Save(ScratchPath("out.htr"), 1.0f), "what was read can be written");
+    if (HasPlainNames(motion))
+        RequireSameBones(motion, "out.htr");
+}

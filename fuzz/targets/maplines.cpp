@@ -1,0 +1,44 @@
+// The older map syntax: whatever a line is, its text stays as it stands, up to a return at its end.
+
+#include "MapLines.h"
+#include "CMapLineList.h"
+#include "FuzzTarget.h"
+#include "ProfileFile.h"
+
+#include <algorithm>
+
+namespace gw {
+
+namespace {
+
+std::string_view WithoutReturns(std::string_view text)
+{
+    return text.substr(0, text.find_last_not_of('\r') + 1);
+}
+
+bool SayTheSame(const CMapLine& a, const CMapLine& b)
+{
+    return a.kind == b.kind && a.source == b.source && a.target == b.target &&
+           WithoutReturns(a.text) == WithoutReturns(b.text);
+}
+
+} // namespace
+
+void FuzzOne(std::span<const std::byte> input)
+{
+    std::vector<CMapLine> lines, again;
+    if (!ReadMapLines(ScratchFile("in.map", input), lines))
+        return Require(input.size() > kProfileByteLimit, "every text is a map");
+    const std::string out = ScratchPath("out.map");
+    Require(WriteMapLines(out, lines), "what was read can be written");
+    if (!ReadMapLines(out, again)) // line ends may have brought it over the limit
+        return;
+    Require(std::ranges::equal(lines, again, SayTheSame), "lines survive a save");
+
+    CMapLineList list;
+    list.Replace(lines, [](const CMapLine&) { return true; });
+    for (const CMapLine& line : list.Lines())
+        RewrittenLine(line);
+}
+
+} // namespace gw
