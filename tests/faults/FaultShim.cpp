@@ -1,0 +1,218 @@
+// Loaded before a program, this makes one call of one kind fail: the FAULT_NUMBERth that the program makes of
+// FAULT_OPERATION, from the start of its main function on. How many it made is written to FAULT_REPORT when
+// it ends. Calls that the system's library makes for itself are not met.
+
+#include <cerrno>
+#include <cstdarg>
+#include <cstdint>
+#include <cstdio>
+#include <cstdlib>
+#include <cstring>
+#include <iterator>
+
+#include <dlfcn.h>
+#include <fcntl.h>
+#include <sys/mman.h>
+#include <sys/syscall.h>
+#include <unistd.h>
+
+// What allocates inside the system's library, under the names that stay when malloc is another.
+extern "C" void* __libc_malloc(size_t size);
+extern "C" void* __libc_calloc(size_t count, size_t size);
+extern "C" void* __libc_realloc(void* block, size_t size);
+
+namespace {
+
+enum class EOperation : int
+{
+    None,
+    Open,
+    Write,
+    Rename,
+    Sync,
+    Close,
+    Map,
+    Mode,
+    Reserve,
+    Allocate,
+};
+
+// By EOperation.
+constexpr const char* kNames[] = {"none",  "open", "write", "rename",  "sync",
+                                  "close", "map",  "mode",  "reserve", "allocate"};
+
+EOperation g_eOperation = EOperation::None;
+long g_iNumber = 0;
+long g_iCalls = 0;
+
+bool IsDue(EOperation operation)
+{
+    return operation == g_eOperation && ++g_iCalls == g_iNumber;
+}
+
+int Refuse(int error)
+{
+    errno = error;
+    return -1;
+}
+
+// The function that would have been called.
+template <class F>
+F* Next(const char* name)
+{
+    return reinterpret_cast<F*>(dlsym(RTLD_NEXT, name));
+}
+
+void Begin()
+{
+    const char* const operation = std::getenv("FAULT_OPERATION");
+    const char* const number = std::getenv("FAULT_NUMBER");
+    g_iNumber = number ? std::atol(number) : 0;
+    for (size_t i = 0; operation && i < std::size(kNames); ++i)
+    {
+        if (std::strcmp(kNames[i], operation) == 0)
+            g_eOperation = static_cast<EOperation>(i);
+    }
+}
+
+// By calls of the system, so that telling is no call that counts.
+void Report()
+{
+    g_eOperation = EOperation::None;
+    const char* const path = std::getenv("FAULT_REPORT");
+    const long file = path ? syscall(SYS_openat, AT_FDCWD, path, O_WRONLY | O_CREAT | O_TRUNC, 0600) : -1;
+    if (file < 0)
+        return;
+    char text[24];
+    const int length = std::snprintf(text, sizeof text, "%ld", g_iCalls);
+    syscall(SYS_write, file, text, static_cast<size_t>(length));
+    syscall(SYS_close, file);
+}
+
+int (*g_pkMain)(int, char**, char**) = nullptr;
+
+int CountedMain(int argc, char** argv, char** environment)
+{
+    Begin();
+    const int result = g_pkMain(argc, argv, environment);
+    Report();
+    return result;
+}
+
+mode_t ModeOf(int flags, va_list arguments)
+{
+    return flags & (O_CREAT | __O_TMPFILE) ? va_arg(arguments, mode_t) : 0;
+}
+
+} // namespace
+
+extern "C" {
+
+// What the system starts a program with: the way to be there from main on, behind all that is made before it.
+int __libc_start_main(int (*main)(int, char**, char**), int argc, char** argv, void (*init)(), void (*fini)(),
+                      void (*loaderFini)(), void* stackEnd)
+{
+    g_pkMain = main;
+    return Next<decltype(__libc_start_main)>("__libc_start_main")(CountedMain, argc, argv, init, fini,
+                                                                  loaderFini, stackEnd);
+}
+
+int open(const char* path, int flags, ...)
+{
+    va_list arguments;
+    va_start(arguments, flags);
+    const mode_t mode = ModeOf(flags, arguments);
+    va_end(arguments);
+    return IsDue(EOperation::Open) ? Refuse(EACCES)
+                                   : static_cast<int>(syscall(SYS_openat, AT_FDCWD, path, flags, mode));
+}
+
+int open64(const char* path, int flags, ...) __attribute__((alias("open")));
+
+std::FILE* fopen(const char* path, const char* mode)
+{
+    if (!IsDue(EOperation::Open))
+        return Next<decltype(fopen)>("fopen")(path, mode);
+    errno = EACCES;
+    return nullptr;
+}
+
+std::FILE* fopen64(const char* path, const char* mode) __attribute__((alias("fopen")));
+
+ssize_t write(int file, const void* bytes, size_t count)
+{
+    return IsDue(EOperation::Write) ? Refuse(ENOSPC) : syscall(SYS_write, file, bytes, count);
+}
+
+int rename(const char* from, const char* to)
+{
+    return IsDue(EOperation::Rename) ? Refuse(EIO) : static_cast<int>(syscall(SYS_rename, from, to));
+}
+
+int fsync(int file)
+{
+    return IsDue(EOperation::Sync) ? Refuse(EIO) : static_cast<int>(syscall(SYS_fsync, file));
+}
+
+int fchmod(int file, mode_t mode)
+{
+    return IsDue(EOperation::Mode) ? Refuse(EPERM) : static_cast<int>(syscall(SYS_fchmod, file, mode));
+}
+
+// The file is closed all the same: what fails is what the file system had still to do.
+int close(int file)
+{
+    const bool due = IsDue(EOperation::Close);
+    const long result = syscall(SYS_close, file);
+    return due ? Refuse(EIO) : static_cast<int>(result);
+}
+
+void* mmap(void* address, size_t length, int protection, int flags, int file, off_t offset)
+{
+    if (file >= 0 && IsDue(EOperation::Map))
+    {
+        errno = ENOMEM;
+        return MAP_FAILED;
+    }
+    return reinterpret_cast<void*>(syscall(SYS_mmap, address, length, protection, flags, file, offset));
+}
+
+void* mmap64(void* address, size_t length, int protection, int flags, int file, off_t offset)
+    __attribute__((alias("mmap")));
+
+int posix_fallocate(int file, off_t offset, off_t length)
+{
+    if (IsDue(EOperation::Reserve))
+        return ENOSPC;
+    return Next<decltype(posix_fallocate)>("posix_fallocate")(file, offset, length);
+}
+
+int posix_fallocate64(int file, off_t offset, off_t length) __attribute__((alias("posix_fallocate")));
+
+#ifndef GAITWRIGHT_SANITIZED
+void* malloc(size_t size)
+{
+    if (!IsDue(EOperation::Allocate))
+        return __libc_malloc(size);
+    errno = ENOMEM;
+    return nullptr;
+}
+
+void* calloc(size_t count, size_t size)
+{
+    if (!IsDue(EOperation::Allocate))
+        return __libc_calloc(count, size);
+    errno = ENOMEM;
+    return nullptr;
+}
+
+void* realloc(void* block, size_t size)
+{
+    if (!IsDue(EOperation::Allocate))
+        return __libc_realloc(block, size);
+    errno = ENOMEM;
+    return nullptr;
+}
+#endif
+
+} // extern "C"

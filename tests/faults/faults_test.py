@@ -1,0 +1,249 @@
+"""Each call that a save rests on fails once: what was there stays whole, nothing is left beside it, and it is told.
+
+The shim counts the calls of a run and lets one of them fail; a test goes through all of them, and through a sample
+of the thousands of allocations."""
+import os
+import random
+import resource
+import shutil
+import signal
+import struct
+import subprocess
+import sys
+import tempfile
+import time
+import unittest
+from pathlib import Path
+
+sys.path.insert(0, str(Path(os.environ["GAITWRIGHT_ROOT"]) / "tests" / "cli"))
+from harness import ASSETS, DONE, FAILED, PROGRAM, SECONDS, WALK, CliTest, main  # noqa: E402
+from made import BVH, HTR, Container, profile  # noqa: E402
+
+if Path("/dev/shm").is_dir():
+    tempfile.tempdir = "/dev/shm"  # thousands of syncs: no disk has to take part
+
+SHIM = os.environ["GAITWRIGHT_FAULT_SHIM"]
+SAVE = os.environ["GAITWRIGHT_SAVE_PROGRAM"]
+SANITIZED = os.environ["GAITWRIGHT_SANITIZED"] == "1"
+OPERATIONS = ["open", "write", "rename", "sync", "close", "map", "mode", "reserve"]
+SAMPLES = 150  # of the allocations of one run
+OLD = b"what was there\n"
+SMALL = profile("Small", [("Hips", "LowerTorso")])
+
+
+def small_motion(number):
+    return BVH.replace("2 90 0", "%d 90 0" % (number + 3))
+
+
+def picture_scene():
+    """An image whose pixels stand in a temporary file while it is in memory."""
+    layout = struct.pack("<IHBiiiHiiI", 0, 1, 0, 2, 2, 0, 0, 96, 96, 1)
+    return Container().record("CImage", 1, "", (0, 0, 0), layout + bytes(range(16)), True).bytes
+
+
+class Case:
+    """A run with the files that it begins with and those that it replaces."""
+
+    def __init__(self, what, command, files, replaced, names):
+        self.what, self.command, self.files, self.replaced, self.names = what, command, files, replaced, names
+
+
+def convert(output):
+    command = [PROGRAM, "convert", "a.bvh", "-o", output, "--force", "--data-dir", ASSETS]
+    return Case("convert to " + output, command, {"a.bvh": WALK.read_bytes(), output: OLD}, [output],
+                ["a.bvh", output, ".prf", "base.htr", "KsBone.bsm", "not enough memory"])
+
+
+def resave():
+    command = [PROGRAM, "resave", "in.orn", "out.orn", "--force"]
+    return Case("resave a picture", command, {"in.orn": picture_scene(), "out.orn": OLD}, ["out.orn"],
+                ["in.orn", "out.orn", "not enough memory"])
+
+
+def batch(job, sources, extension):
+    command = [PROGRAM, "batch", "takes", "--job", job, "--data-dir", ASSETS]
+    command += ["--profile", "small.prf"] if job == "htr" else []
+    results = [name[:-4] + extension for name in sources]
+    files = {**sources, **{name: OLD for name in results}, "small.prf": SMALL}
+    return Case("batch to " + job, command, files, results,
+                ["takes/", ".prf", "base.htr", "KsBone.bsm", "not enough memory"])
+
+
+def save(kind, path, content):
+    return Case("save a " + kind, [SAVE, kind, path], {path: content}, [path], [path, "not enough memory"])
+
+
+def cases():
+    yield batch("htr", {"takes/a.bvh": BVH, "takes/b.bvh": small_motion(4)}, ".htr")
+    yield batch("orn", {"takes/a.htr": HTR, "takes/b.htr": HTR}, ".orn")
+    yield convert("out.htr")
+    yield convert("out.Kinetra")
+    yield resave()
+    yield save("profile", "small.prf", SMALL)
+    yield save("map", "small.map", SMALL)
+    yield save("setting", "home/.config/Tessarine/Gaitwright.conf", "[Settings]\nOther=1\n")
+
+
+class Faults(CliTest):
+    def setUp(self):
+        super().setUp()
+        self.environment["TMPDIR"] = str(self.folder)  # so that nothing is left there unseen
+
+    def begin(self, case):
+        for entry in self.folder.iterdir():
+            shutil.rmtree(entry) if entry.is_dir() else entry.unlink()
+        for name, content in case.files.items():
+            self.write(name, content)
+
+    def start(self, case, operation="none", number=0, file_limit=None):
+        """Exit code, standard error and the calls that there were of the operation."""
+        report = str(self.folder) + "-calls"
+        self.addCleanup(Path(report).unlink, missing_ok=True)
+        environment = dict(self.environment, LD_PRELOAD=self.preload(), FAULT_OPERATION=operation,
+                           FAULT_NUMBER=str(number), FAULT_REPORT=report)
+
+        def limit():
+            resource.setrlimit(resource.RLIMIT_FSIZE, (file_limit, file_limit))
+
+        done = subprocess.run(list(map(str, case.command)), cwd=self.folder, env=environment, timeout=SECONDS,
+                              capture_output=True, preexec_fn=limit if file_limit is not None else None)
+        calls = int(Path(report).read_text()) if Path(report).exists() and file_limit is None else 0
+        return done.returncode, done.stderr.decode(), calls
+
+    def preload(self):
+        if not SANITIZED:
+            return SHIM
+        runtime = subprocess.run(["g++", "-print-file-name=libasan.so"], capture_output=True, check=True)
+        return runtime.stdout.decode().strip() + " " + SHIM
+
+    def content(self, case):
+        return {name: self.read(name) for name in case.files}
+
+    def assert_whole(self, case, good, code, words):
+        self.assertIn(code, (DONE, FAILED), words)
+        self.assertNotIn("terminate", words)
+        before = {name: content if isinstance(content, bytes) else content.encode()
+                  for name, content in case.files.items()}
+        self.assertEqual(self.files(), sorted(case.files), "nothing is left, nothing is gone")
+        now = self.content(case)
+        for name in case.files:
+            self.assertIn(now[name], (before[name], good[name]), name)
+        if code == DONE:
+            self.assertEqual(now, good, "a run that answers well has done all")
+        else:
+            self.assertTrue(any(name in words for name in case.names), words)
+
+    def undisturbed(self, case, operation):
+        self.begin(case)
+        code, words, calls = self.start(case, operation)
+        self.assertEqual(code, DONE, words)
+        good = self.content(case)
+        for name in case.replaced:
+            self.assertNotEqual(good[name], case.files[name])
+        return good, calls
+
+    def go_through(self, operations, samples):
+        for case in cases():
+            for operation in operations:
+                good, calls = self.undisturbed(case, operation)
+                step = max(1, calls // samples)
+                failed = 0
+                for number in range(1, calls + 1, step):
+                    with self.subTest(case.what, operation=operation, number=number):
+                        self.begin(case)
+                        code, words, _ = self.start(case, operation, number)
+                        self.assert_whole(case, good, code, words)
+                        failed += code == FAILED
+                print("%s: %s: %d calls, %d tried, %d told" % (case.what, operation, calls,
+                                                               len(range(1, calls + 1, step)), failed), flush=True)
+                if operation in ("write", "rename", "sync"):
+                    self.assertEqual(failed, calls, "what was not written may not be told as saved")
+                    self.assertGreater(calls, 0)
+
+    def test_a_call_of_the_system_that_fails(self):
+        self.go_through(OPERATIONS, 1000)
+
+    @unittest.skipIf(SANITIZED, "the sanitizer has the allocations")
+    def test_memory_that_is_not_there(self):
+        self.go_through(["allocate"], SAMPLES)
+
+    def test_a_limit_on_the_size_of_files(self):
+        for case in cases():
+            good, _ = self.undisturbed(case, "none")
+            for limit in (0, 10):
+                with self.subTest(case.what, limit=limit):
+                    self.begin(case)
+                    code, words, _ = self.start(case, file_limit=limit)
+                    self.assertEqual(code, FAILED, words)
+                    self.assert_whole(case, good, code, words)
+
+    def test_a_device_that_is_full(self):
+        self.write("a.bvh", BVH)
+        self.write("small.prf", SMALL)
+        for output in ("full.htr", "full.Kinetra"):
+            (self.folder / output).symlink_to("/dev/full")
+            result = self.with_assets("convert", "a.bvh", "-o", output, "--force", "--profile", "small.prf")
+            self.assertEqual(result.code, FAILED)
+            self.assert_words(result, [output])
+            self.assertTrue((self.folder / output).is_symlink())
+        with open("/dev/full", "wb") as full:
+            result = self.with_assets("convert", "a.bvh", "-o", "a.htr", "--profile", "small.prf", stdout=full)
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["standard output"])
+        self.assertEqual(self.files(), ["a.bvh", "a.htr", "small.prf"])
+
+
+class Killed(CliTest):
+    """A run that is killed leaves whole files only, and the next one does the rest."""
+
+    SOURCES = 40
+
+    def setUp(self):
+        super().setUp()
+        self.write("small.prf", SMALL)
+        for number in range(self.SOURCES):
+            self.write("takes/%02d.bvh" % number, small_motion(number))
+
+    def run_killed(self, arguments, seconds):
+        command = [PROGRAM, *map(str, arguments), "--data-dir", str(ASSETS)]
+        running = subprocess.Popen(command, cwd=self.folder, env=self.environment, stdout=subprocess.DEVNULL,
+                                   stderr=subprocess.DEVNULL)
+        try:
+            running.wait(seconds)
+        except subprocess.TimeoutExpired:
+            running.send_signal(signal.SIGKILL)
+        return running.wait()
+
+    def results(self, folder, extension):
+        return {path.name: path.read_bytes() for path in (self.folder / folder).glob("*" + extension)
+                if not path.name.startswith(".")}
+
+    def assert_survives(self, arguments, folder, extension):
+        begin = time.monotonic()
+        self.succeed(*arguments)
+        length = time.monotonic() - begin
+        good = self.results(folder, extension)
+        self.assertEqual(len(good), self.SOURCES)
+        chance = random.Random(7)
+        killed = 0
+        for round_number in range(12):
+            for path in (self.folder / folder).glob("*" + extension):
+                path.unlink()
+            killed += self.run_killed(arguments, chance.random() * length) == -signal.SIGKILL
+            for name, content in self.results(folder, extension).items():
+                self.assertEqual(content, good[name], "%s in round %d" % (name, round_number))
+            self.succeed(*arguments)
+            self.assertEqual(self.results(folder, extension), good)
+            self.assertEqual([p.name for p in (self.folder / folder).iterdir() if p.name.startswith(".")], [])
+        self.assertGreater(killed, 0)
+
+    def test_a_batch(self):
+        self.assert_survives(["batch", "takes", "--job", "htr", "--profile", "small.prf"], "takes", ".htr")
+
+    def test_a_conversion_of_a_folder(self):
+        self.assert_survives(["convert", "takes", "--out-dir", "out", "--profile", "small.prf", "--skip-existing"],
+                             "out", ".Kinetra")
+
+
+if __name__ == "__main__":
+    main()
