@@ -206,6 +206,8 @@ void CPixelBuffer::Fields(CFieldArchive& archive)
         return ReadPixels(archive);
     // Only read, by an archive that takes what it reads and what it fills alike.
     const CPixelAccess<const CPixelBuffer, uint8_t> view(*this);
+    if (!view && !IsEmpty())
+        archive.Refuse(EFailure::OutOfMemory);
     m_kLayout.Fields(archive);
     std::span<uint8_t> bytes = view.Bytes();
     if (archive.Presence("pixels", !bytes.empty()))

@@ -211,7 +211,7 @@ public:
     /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is
     /// none.
     virtual size_t Fitting(int64_t count, size_t elementBytes);
-    /// Ends a read here, as damaged or for want of room; fields that follow read as zeros.
+    /// Ends a read here, as damaged or for want of room; fields that follow read as zeros. A write fails.
     virtual void Refuse(EFailure) {}
 
 protected:

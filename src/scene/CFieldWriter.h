@@ -22,11 +22,13 @@ public:
     void Text(const char* name, CText& text) override;
     bool Presence(const char* name, bool present) override;
     size_t Count(const char* name, size_t count, size_t leastBytes) override;
+    /// What is written cannot be had: the file is not to stand.
+    void Refuse(EFailure) override { m_bRefused = true; }
 
     void WriteString(std::string_view text);
     void WriteUnsigned(uint32_t value);
     void WriteBytes(std::span<const std::byte> bytes);
-    /// Hands the gathered bytes on. False when the sink has refused anything since the start.
+    /// Hands the gathered bytes on. False when the sink or a class has refused anything since the start.
     bool Flush();
 
 protected:
