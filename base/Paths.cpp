@@ -4,8 +4,10 @@
 #include "Text.h"
 
 #include <algorithm>
+#include <cerrno>
 #include <filesystem>
 #include <memory>
+#include <new>
 #include <system_error>
 
 #include <dirent.h>
@@ -125,6 +127,8 @@ std::vector<std::string> NamesInFolder(const std::string& folder)
 {
     std::vector<std::string> names;
     const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(folder.c_str()), closedir);
+    if (!directory && errno == ENOMEM)
+        throw std::bad_alloc();
     while (const dirent* entry = directory ? readdir(directory.get()) : nullptr)
         names.emplace_back(entry->d_name);
     return names;

@@ -45,7 +45,7 @@ BROKEN_HTR = [
     ("an empty file", "", 0, "Hierarchy"),
     ("a ring of bones", htr("Hips GLOBAL", "Hips Chest"), 22, '"Hips"'),
     ("a bone that is its own parent", htr("Chest Hips", "Chest Chest"), 26, '"Chest"'),
-    ("a name that a zero byte ends", htr("Chest Hips", "\0Chest Hips"), 16, "zero byte"),
+    ("a name that a zero byte ends", htr("Chest Hips", "\0Chest Hips"), 17, "zero byte"),
     ("more frames than any file has", htr("NumFrames 2", "NumFrames 2000000000"), 6, "NumFrames"),
     ("no number in a row", htr("2 1 0 0 0 0 90 1", "2 nan 0 0 0 0 90 1"), 25, '"nan"'),
     ("an infinity in the rest pose", htr("Hips 0 90 0", "Hips 0 inf 0"), 20, '"inf"'),
