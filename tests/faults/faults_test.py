@@ -26,7 +26,7 @@ SHIM = os.environ["GAITWRIGHT_FAULT_SHIM"]
 SAVE = os.environ["GAITWRIGHT_SAVE_PROGRAM"]
 SANITIZED = os.environ["GAITWRIGHT_SANITIZED"] == "1"
 OPERATIONS = ["open", "write", "rename", "sync", "close", "map", "mode", "reserve"]
-SAMPLES = 150  # of the allocations of one run
+SAMPLES = 100  # of the allocations of one run
 OLD = b"what was there\n"
 SMALL = profile("Small", [("Hips", "LowerTorso")])
 
