@@ -53,9 +53,16 @@ CRowNumbers CMapRowTable::Numbers(int row) const
 
 int CMapRowTable::FindTarget(std::string_view target) const
 {
-    const auto same = [=](const Row& row) { return EqualNoCase(row[kTargetColumn], target); };
-    const auto found = std::ranges::find_if(m_kRows, same);
-    return found == m_kRows.end() ? kNone : static_cast<int>(found - m_kRows.begin());
+    if (m_kRowOfTarget.empty())
+        IndexTargets();
+    const auto found = m_kRowOfTarget.find(LowerCase(target));
+    return found == m_kRowOfTarget.end() ? kNone : found->second;
+}
+
+void CMapRowTable::IndexTargets() const
+{
+    for (int row = 0; row < RowCount(); ++row)
+        m_kRowOfTarget.emplace(LowerCase(Text(row, kTargetColumn)), row);
 }
 
 void CMapRowTable::AddRow(std::string_view source, std::string_view target, const CRowNumbers& numbers,
@@ -66,6 +73,7 @@ void CMapRowTable::AddRow(std::string_view source, std::string_view target, cons
     {
         m_kRows.emplace_back()[kSourceColumn] = source;
         m_kSelected.push_back(false);
+        m_kRowOfTarget.emplace(LowerCase(target), RowCount() - 1);
     }
     Row& row = found == kNone ? m_kRows.back() : m_kRows[Index(found)];
     row[kTargetColumn] = target;
@@ -88,12 +96,14 @@ void CMapRowTable::RemoveRow(int row)
         return;
     m_kRows.erase(m_kRows.begin() + row);
     m_kSelected.erase(m_kSelected.begin() + row);
+    m_kRowOfTarget.clear();
 }
 
 void CMapRowTable::Clear()
 {
     m_kRows.clear();
     m_kSelected.clear();
+    m_kRowOfTarget.clear();
 }
 
 void CMapRowTable::Select(int row, bool selected)

@@ -6,6 +6,7 @@
 #include <deque>
 #include <string>
 #include <string_view>
+#include <unordered_map>
 #include <vector>
 
 namespace gw {
@@ -90,9 +91,13 @@ public:
 private:
     static size_t Index(int row) { return static_cast<size_t>(row); }
     bool Has(int row) const { return row >= 0 && row < RowCount(); }
+    void IndexTargets() const;
 
     std::deque<Row> m_kRows;       // Remove All takes rows off the front
     std::vector<bool> m_kSelected; // one for each row
+    // By target in small letters; empty after a removal, which moves rows, until somebody looks for one. A
+    // file can name thousands of targets, and each row that it adds looks for its own.
+    mutable std::unordered_map<std::string, int> m_kRowOfTarget;
 };
 
 } // namespace gw
