@@ -14,9 +14,9 @@ namespace gw {
 class CBoneMesh;
 class CKeyframeControl;
 
-/// More bones than any skeleton has. Each is three scene objects, of which there can be 8 million, and
-/// attaching a child takes time by the number of its brothers.
-inline constexpr size_t kBoneLimit = 32768;
+/// More bones than any skeleton has. Each is three scene objects and an HTR file has each twice, which a line
+/// of four bytes asks for; and attaching a child takes time by the number of its brothers.
+inline constexpr size_t kBoneLimit = 16384;
 
 /// Longer names of bones are refused.
 inline constexpr size_t kNameLimit = 255;
