@@ -23,12 +23,36 @@ namespace {
 constexpr float kBodyWeight = 0.45f;
 // Frame numbers are floats, and from here on the next one is the same.
 constexpr float kFrameLimit = 16777216.0f;
-// What the tracks of a result may take. A container can name any end time without a byte behind it.
+// What the tracks of a result may take: no more than 2 GB, and beyond a size that any machine has, as much as
+// the source's own keys let expect. A container can name any end time without a byte behind it.
 constexpr uint64_t kResultBytesLimit = uint64_t{1} << 31;
+constexpr uint64_t kAnyResultBytes = uint64_t{32} << 20; // twenty minutes of the fixed skeleton
+constexpr uint64_t kResultBytesPerSourceByte = 4;
 constexpr uint64_t kKeyBytes = sizeof(float) + sizeof(Quat) + 2 * sizeof(Vec3);
 
 constexpr size_t kProgressFrames = 64;
 constexpr float kUsualFrameSeconds = 1.0f / 30.0f; // where a source gives no usable one
+
+// The bytes of all keys below a node; the times may be claims as well.
+uint64_t KeyBytesOf(CNode& root)
+{
+    std::vector<CObject*> found;
+    root.FindObjects(found, nullptr, &CKeyframeControl::ms_kRTTI, true);
+    uint64_t bytes = 0;
+    for (const CObject* object : found)
+    {
+        const auto& track = static_cast<const CKeyframeControl&>(*object);
+        bytes += track.m_kRotationKeys.size() * sizeof(Quat) +
+                 (track.m_kPositionKeys.size() + track.m_kScaleKeys.size()) * sizeof(Vec3);
+    }
+    return bytes;
+}
+
+bool IsInProportion(uint64_t resultBytes, CNode& source)
+{
+    const uint64_t expected = kAnyResultBytes + kResultBytesPerSourceByte * KeyBytesOf(source);
+    return resultBytes <= std::min(expected, kResultBytesLimit);
+}
 
 void RestPose(CNode& root)
 {
@@ -163,7 +187,7 @@ bool CRetargeter::Retarget(float begin, float last, float phase, float frequency
     matcher.ReadTranslation(0);
 
     uint64_t frameCount = FrameCount(last);
-    if (frameCount * kKeyBytes * matcher.Bones().size() > kResultBytesLimit)
+    if (!IsInProportion(frameCount * kKeyBytes * matcher.Bones().size(), source))
     {
         m_kRecord.Fail(EFailure::TooLarge);
         frameCount = 0;
