@@ -16,7 +16,10 @@
 #endif
 
 #ifdef GW_COUNTS_MEMORY
-#include <sanitizer/allocator_interface.h>
+// The sanitizer's own functions. Their header comes with one of the two compilers only.
+extern "C" int __sanitizer_install_malloc_and_free_hooks(void (*onAllocated)(const volatile void*, size_t),
+                                                         void (*onFreed)(const volatile void*));
+extern "C" size_t __sanitizer_get_allocated_size(const volatile void* block);
 #endif
 
 namespace gw {
