@@ -8,20 +8,15 @@
 
 namespace gw {
 
-CPrivateProfile::~CPrivateProfile()
-{
-    if (!m_kPath.empty())
-        DeleteFile(m_kPath);
-}
-
 bool CPrivateProfile::Write(std::string_view text)
 {
     std::error_code error;
     const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    if (m_kPath.empty() && !error)
-        m_kPath = CreatePrivateFile(folder + "gaitwright", ".prf");
+    if (!m_kFile && !error)
+        m_kFile.emplace(folder, ".prf");
     CSafeFile file;
-    return !m_kPath.empty() && file.Open(m_kPath) && file.Write(text) && file.Commit();
+    return m_kFile && !m_kFile->Path().empty() && file.Open(m_kFile->Path()) && file.Write(text) &&
+           file.Commit();
 }
 
 } // namespace gw

@@ -1,5 +1,8 @@
 #pragma once
 
+#include "CPrivateFile.h"
+
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -9,18 +12,13 @@ namespace gw {
 class CPrivateProfile
 {
 public:
-    CPrivateProfile() = default;
-    ~CPrivateProfile();
-    CPrivateProfile(const CPrivateProfile&) = delete;
-    CPrivateProfile& operator=(const CPrivateProfile&) = delete;
-
     /// Replaces what was written before. False where the folder for temporary files takes none.
     bool Write(std::string_view text);
     /// Empty before the first Write.
-    const std::string& Path() const { return m_kPath; }
+    std::string Path() const { return m_kFile ? m_kFile->Path() : std::string(); }
 
 private:
-    std::string m_kPath;
+    std::optional<CPrivateFile> m_kFile;
 };
 
 } // namespace gw
