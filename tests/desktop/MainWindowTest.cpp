@@ -255,10 +255,10 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("Invalid BVH file format.")});
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("broken.bvh:2:"));
 
-    std::string fivefold = ReadBytes(ExampleFile("walk.bvh"));
-    fivefold.insert(fivefold.find("Frames:"), "\n");
-    fivefold.replace(fivefold.find("JOINT ") + 6, 0, "my ");
-    WriteBytes(broken, fivefold);
+    std::string twofold = ReadBytes(ExampleFile("walk.bvh"));
+    twofold.insert(twofold.find("Frames:"), 1, '\n');
+    twofold.insert(twofold.find("JOINT ") + 6, "my ");
+    WriteBytes(broken, twofold);
     person.WillAnswer("ok");
     person.Drop(broken);
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("a blank"))
