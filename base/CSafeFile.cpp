@@ -2,6 +2,7 @@
 
 #include "CPrivateFile.h"
 #include "Paths.h"
+#include "PrivateNames.h"
 
 #include <cerrno>
 #include <filesystem>
@@ -51,6 +52,13 @@ bool MayReplace(const std::string& path, unsigned& mode)
 
 } // namespace
 
+std::function<bool()> CSafeFile::ms_kCommitGate;
+
+void CSafeFile::SetCommitGate(std::function<bool()> gate)
+{
+    ms_kCommitGate = std::move(gate);
+}
+
 CSafeFile::~CSafeFile()
 {
     Discard();
@@ -92,13 +100,20 @@ bool CSafeFile::Commit()
     const int file = std::exchange(m_iFile, -1);
     if (file < 0)
         return false;
-    bool good = !m_bFailed && (m_uiMode == 0 || fchmod(file, m_uiMode) == 0) && fsync(file) == 0;
+    bool good = !m_bFailed && (m_uiMode == 0 || fchmod(file, m_uiMode) == 0) && Sync(file);
     good = close(file) == 0 && good;
     good = good && rename(m_kPrivatePath.c_str(), m_kPath.c_str()) == 0;
     if (good)
         m_kPrivatePath.clear();
     Discard();
     return good;
+}
+
+bool CSafeFile::Sync(int file) const
+{
+    if (IsPrivateName(std::string_view(m_kPath).substr(FolderOf(m_kPath).size())))
+        return true;
+    return fsync(file) == 0 && (!ms_kCommitGate || ms_kCommitGate());
 }
 
 void CSafeFile::Discard()

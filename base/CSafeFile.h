@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <functional>
 #include <span>
 #include <string>
 #include <string_view>
@@ -24,14 +25,22 @@ public:
     /// Writes all bytes; false when the file system does not take them, and Commit will then fail too.
     bool Write(std::string_view text);
     bool Write(std::span<const std::byte> bytes);
-    /// Syncs and renames. False leaves the destination untouched.
+    /// Syncs and renames. False leaves the destination untouched. A private file is not synced: whoever made
+    /// it reads it at once and removes it.
     bool Commit();
     /// Where the bytes lie before Commit.
     const std::string& PrivatePath() const { return m_kPrivatePath; }
 
+    /// From now on Commit asks before it renames, when all bytes are on the disk; false fails it. It is the
+    /// process's own: a program that works ahead holds back here what comes out of turn. Private files are
+    /// not asked for. An empty gate lets all pass.
+    static void SetCommitGate(std::function<bool()> gate);
+
 private:
+    bool Sync(int file) const;
     void Discard();
 
+    static std::function<bool()> ms_kCommitGate;
     std::string m_kPath;
     std::string m_kPrivatePath;
     int m_iFile = -1;

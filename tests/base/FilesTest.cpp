@@ -370,4 +370,19 @@ TEST(PrivateNames, OnlyWhatADeadProgramLeftIsRemoved)
     EXPECT_EQ(EntryCount(folder), 4u);
 }
 
+TEST(CSafeFile, AGateHoldsBackWhatWouldTakeItsName)
+{
+    const CTempFolder folder;
+    const CPrivateFile intermediate(folder.Path("walk.Kinetra"), ".htr");
+    int asked = 0;
+    CSafeFile::SetCommitGate([&] { return ++asked > 1; });
+    EXPECT_TRUE(Save(intermediate.Path(), "new"));
+    EXPECT_EQ(asked, 0);
+    EXPECT_FALSE(Save(folder.Path("walk.Kinetra"), "new"));
+    EXPECT_EQ(EntryCount(folder), 1u);
+    EXPECT_TRUE(Save(folder.Path("walk.Kinetra"), "new"));
+    CSafeFile::SetCommitGate({});
+    EXPECT_EQ(EntryCount(folder), 2u);
+}
+
 } // namespace gw
