@@ -1,0 +1,49 @@
+#include "CReportFile.h"
+
+#include <cerrno>
+#include <utility>
+
+#include <fcntl.h>
+#include <unistd.h>
+
+namespace gw {
+
+CReportFile::~CReportFile()
+{
+    if (m_iFile >= 0)
+        close(m_iFile);
+}
+
+bool CReportFile::Open(const std::string& path, EStart start)
+{
+    if (m_iFile >= 0)
+        close(std::exchange(m_iFile, -1));
+    // Read too, to see how the file ends.
+    const int cut = start == EStart::Empty ? O_TRUNC : 0;
+    m_iFile = open(path.c_str(), O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC | cut, 0666);
+    m_bFailed = m_iFile < 0;
+    return !m_bFailed && (!HasOpenLine() || AddLine({}));
+}
+
+bool CReportFile::HasOpenLine() const
+{
+    const off_t size = lseek(m_iFile, 0, SEEK_END);
+    char last = '\n';
+    return size > 0 && pread(m_iFile, &last, 1, size - 1) == 1 && last != '\n';
+}
+
+bool CReportFile::AddLine(std::string_view line)
+{
+    const std::string text = std::string(line) + '\n';
+    for (std::string_view rest = text; !m_bFailed && !rest.empty();)
+    {
+        const ssize_t count = write(m_iFile, rest.data(), rest.size());
+        if (count > 0)
+            rest.remove_prefix(static_cast<size_t>(count));
+        else if (errno != EINTR)
+            m_bFailed = true;
+    }
+    return !m_bFailed;
+}
+
+} // namespace gw

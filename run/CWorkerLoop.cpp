@@ -1,0 +1,61 @@
+#include "CWorkerLoop.h"
+
+#include "CSafeFile.h"
+#include "WorkerMessages.h"
+
+#include <cerrno>
+#include <sys/socket.h>
+
+namespace gw {
+
+namespace {
+
+// False when the program is gone or wants no more.
+bool Receive(int socket, CWorkerOrder& order)
+{
+    ssize_t count = 0;
+    do
+        count = recv(socket, &order, sizeof order, 0);
+    while (count < 0 && errno == EINTR);
+    return count == sizeof order;
+}
+
+bool Reply(int socket, const CWorkerReply& reply)
+{
+    return send(socket, &reply, sizeof reply, MSG_NOSIGNAL) == sizeof reply;
+}
+
+} // namespace
+
+CWorkerLoop::CWorkerLoop(CJobHandler& handler, int socket, std::FILE* record, ECommit commit)
+    : m_kHandler(handler), m_iSocket(socket), m_pkRecord(record)
+{
+    if (commit == ECommit::InTurn)
+        CSafeFile::SetCommitGate([this] { return AskToCommit(); });
+}
+
+void CWorkerLoop::Run()
+{
+    for (CWorkerOrder order; Receive(m_iSocket, order);)
+    {
+        const Clock::time_point start = Clock::now();
+        m_kWaited = {};
+        m_bMayCommit = false;
+        const uint8_t answer = m_kHandler.Run(order.job, m_pkRecord);
+        const std::chrono::duration<double> worked = Clock::now() - start - m_kWaited;
+        std::fflush(nullptr);
+        if (!Reply(m_iSocket, {.answer = answer, .seconds = worked.count()}))
+            return;
+    }
+}
+
+bool CWorkerLoop::AskToCommit()
+{
+    const Clock::time_point start = Clock::now();
+    CWorkerOrder order;
+    m_bMayCommit = m_bMayCommit || (Reply(m_iSocket, {.asks = true}) && Receive(m_iSocket, order));
+    m_kWaited += Clock::now() - start;
+    return m_bMayCommit;
+}
+
+} // namespace gw

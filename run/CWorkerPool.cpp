@@ -1,0 +1,190 @@
+// Jobs go out in their order to whichever process is free, ends come back in any, and are taken in order.
+//
+// A run that ends with its first failure must leave what it leaves when the jobs are done one by one, however
+// many processes work ahead. So each asks before its file takes its place, and gets leave when all earlier
+// jobs have ended well. While it waits it needs no core: another process is started in its stead, up to a
+// bound.
+
+#include "CWorkerPool.h"
+
+#include "CInterrupt.h"
+
+#include <algorithm>
+#include <utility>
+
+#include <poll.h>
+
+namespace gw {
+
+namespace {
+
+using EState = CWorkerProcess::EState;
+
+constexpr size_t kAhead = 4;               // processes for each that works, those that wait included
+constexpr int kTickMilliseconds = 100;     // at the latest
+constexpr std::chrono::seconds kGrace(10); // for what is under way when the run is to end
+
+} // namespace
+
+CWorkerPool::CWorkerPool(CJobHandler& handler, const CPoolSettings& settings)
+    : m_kHandler(handler), m_kSettings(settings)
+{
+}
+
+CWorkerPool::~CWorkerPool() = default;
+
+bool CWorkerPool::Run(size_t jobCount, const CInterrupt& interrupt)
+{
+    for (;;)
+    {
+        if (!m_kEnding && (m_bRefused || interrupt.Count() > 0))
+            m_kEnding = Clock::now();
+        if (!m_kEnding)
+            GiveJobs(jobCount);
+        OpenGate();
+        if (CountIn(EState::Running) == 0)
+            break;
+        Wait();
+        ReceiveAll();
+        if (m_kEnding && (interrupt.Count() > 1 || Clock::now() - *m_kEnding > kGrace))
+            AbandonRunning();
+        KillLate();
+        TakeEnds();
+        m_kHandler.Tick(m_uiTaken + m_kEnded.size());
+    }
+    Dismiss();
+    TakeRest();
+    return m_kEnding || m_uiTaken == jobCount;
+}
+
+size_t CWorkerPool::CountIn(EState state) const
+{
+    return static_cast<size_t>(
+        std::ranges::count_if(m_kWorkers, [=](const auto& worker) { return worker->State() == state; }));
+}
+
+CWorkerProcess* CWorkerPool::FindIdle()
+{
+    const auto isIdle = [](const auto& worker) { return worker->State() == EState::Idle; };
+    const auto found = std::ranges::find_if(m_kWorkers, isIdle);
+    return found == m_kWorkers.end() ? nullptr : found->get();
+}
+
+CWorkerProcess* CWorkerPool::StartWorker()
+{
+    const size_t limit = m_kSettings.workerCount * (m_kSettings.commit == ECommit::InTurn ? kAhead : 1);
+    if (m_kWorkers.size() >= limit)
+        return nullptr;
+    std::vector<int> sockets;
+    for (const auto& worker : m_kWorkers)
+        sockets.push_back(worker->Socket());
+    std::unique_ptr<CWorkerProcess> worker = CWorkerProcess::Start(m_kHandler, m_kSettings.commit, sockets);
+    return worker ? m_kWorkers.emplace_back(std::move(worker)).get() : nullptr;
+}
+
+void CWorkerPool::GiveJobs(size_t jobCount)
+{
+    while (m_uiNext < jobCount && CountIn(EState::Running) < m_kSettings.workerCount)
+    {
+        CWorkerProcess* worker = FindIdle();
+        if (!worker)
+            worker = StartWorker();
+        if (!worker)
+            return;
+        worker->Give(m_uiNext++);
+    }
+}
+
+// The one whose turn it is; what it does then no longer depends on any other.
+void CWorkerPool::OpenGate()
+{
+    for (const auto& worker : m_kWorkers)
+    {
+        if (!m_bRefused && worker->State() == EState::Waiting && worker->Job() == m_uiTaken)
+            worker->LetCommit();
+    }
+}
+
+void CWorkerPool::Wait() const
+{
+    std::vector<pollfd> sockets;
+    for (const auto& worker : m_kWorkers)
+        sockets.push_back({worker->Socket(), POLLIN, 0});
+    poll(sockets.data(), sockets.size(), kTickMilliseconds);
+}
+
+void CWorkerPool::ReceiveAll()
+{
+    for (const auto& worker : m_kWorkers)
+    {
+        CJobEnd end;
+        if (worker->Receive(end))
+            KeepEnd(*worker, std::move(end));
+    }
+    ForgetGone();
+}
+
+void CWorkerPool::KillLate()
+{
+    for (const auto& worker : m_kWorkers)
+    {
+        if (worker->State() != EState::Running || worker->RunningSeconds() < m_kSettings.jobSeconds)
+            continue;
+        CJobEnd end;
+        worker->Kill(end);
+        KeepEnd(*worker, std::move(end));
+    }
+    ForgetGone();
+}
+
+// Their jobs count as not begun.
+void CWorkerPool::AbandonRunning()
+{
+    for (const auto& worker : m_kWorkers)
+    {
+        if (worker->State() != EState::Running)
+            continue;
+        CJobEnd end;
+        worker->Kill(end);
+        m_kHandler.Lost(worker->Job());
+    }
+    ForgetGone();
+}
+
+void CWorkerPool::KeepEnd(CWorkerProcess& worker, CJobEnd&& end)
+{
+    if (worker.State() == EState::Gone)
+        m_kHandler.Lost(worker.Job());
+    m_kEnded.emplace(worker.Job(), std::move(end));
+}
+
+void CWorkerPool::ForgetGone()
+{
+    std::erase_if(m_kWorkers, [](const auto& worker) { return worker->State() == EState::Gone; });
+}
+
+void CWorkerPool::TakeEnds()
+{
+    while (!m_bRefused && !m_kEnded.empty() && m_kEnded.begin()->first == m_uiTaken)
+    {
+        const auto first = m_kEnded.extract(m_kEnded.begin());
+        m_bRefused = !m_kHandler.Take(m_uiTaken++, first.mapped());
+    }
+}
+
+// What ended behind a job that was abandoned.
+void CWorkerPool::TakeRest()
+{
+    for (auto end = m_kEnded.begin(); !m_bRefused && end != m_kEnded.end(); ++end)
+        m_bRefused = !m_kHandler.Take(end->first, end->second);
+}
+
+// All are told before any is waited for.
+void CWorkerPool::Dismiss()
+{
+    for (const auto& worker : m_kWorkers)
+        worker->Close();
+    m_kWorkers.clear();
+}
+
+} // namespace gw

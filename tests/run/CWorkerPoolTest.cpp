@@ -1,0 +1,184 @@
+#include "CWorkerPool.h"
+
+#include "CInterrupt.h"
+#include "CSafeFile.h"
+#include "Paths.h"
+#include "TempFolder.h"
+
+#include <algorithm>
+#include <csignal>
+#include <gtest/gtest.h>
+#include <unistd.h>
+
+namespace gw {
+
+namespace {
+
+using EKind = CJobEnd::EKind;
+
+enum class EDeed
+{
+    Good,
+    Bad, ///< the run ends with it, if it ends with any
+    Crash,
+    Exit, ///< as a sanitizer ends a program
+    Hang,
+    Interrupt, ///< the program that started it
+};
+
+// Each job writes a file of its number, and does what it is told.
+class CDeeds : public CJobHandler
+{
+public:
+    CDeeds(std::vector<EDeed> deeds, const CTempFolder& folder, bool goesOn = true)
+        : m_kDeeds(std::move(deeds)), m_kFolder(folder), m_bGoesOn(goesOn)
+    {
+    }
+
+    uint8_t Run(size_t job, std::FILE* record) override
+    {
+        std::printf("output %zu\n", job);
+        std::fprintf(stderr, "words %zu\n", job);
+        std::fprintf(record, "record %zu by %d\n", job, getpid());
+        std::fflush(nullptr);
+        if (job % 3 == 0)
+            usleep(20'000); // the first of each three is behind the others
+        Do(m_kDeeds[job]);
+        CSafeFile file;
+        const bool written =
+            file.Open(m_kFolder.Path(std::to_string(job))) && file.Write("result") && file.Commit();
+        return written && m_kDeeds[job] != EDeed::Bad ? 1 : 0;
+    }
+
+    void Lost(size_t job) override { lost.push_back(job); }
+
+    bool Take(size_t job, const CJobEnd& end) override
+    {
+        EXPECT_EQ(end.output, "output " + std::to_string(job) + '\n');
+        EXPECT_EQ(end.words, "words " + std::to_string(job) + '\n');
+        processes.push_back(end.record.substr(end.record.find("by")));
+        taken.push_back(job);
+        kinds.push_back(end.kind);
+        good += end.kind == EKind::Ran ? end.answer : 0;
+        return m_bGoesOn || (end.kind == EKind::Ran && end.answer == 1);
+    }
+
+    std::vector<size_t> taken;
+    std::vector<size_t> lost;
+    std::vector<EKind> kinds;
+    std::vector<std::string> processes;
+    size_t good = 0;
+
+private:
+    static void Do(EDeed deed)
+    {
+        if (deed == EDeed::Crash)
+            std::raise(SIGKILL);
+        if (deed == EDeed::Exit)
+            _exit(3);
+        if (deed == EDeed::Interrupt)
+            kill(getppid(), SIGINT);
+        while (deed == EDeed::Hang)
+            pause();
+    }
+
+    std::vector<EDeed> m_kDeeds;
+    const CTempFolder& m_kFolder;
+    bool m_bGoesOn;
+};
+
+std::vector<EDeed> Deeds(size_t count, size_t at, EDeed deed)
+{
+    std::vector<EDeed> deeds(count, EDeed::Good);
+    deeds[at] = deed;
+    return deeds;
+}
+
+bool RunDeeds(CDeeds& deeds, size_t count, size_t workers, ECommit commit, double limit = 60.0)
+{
+    const CInterrupt interrupt;
+    return CWorkerPool(deeds, {workers, limit, commit}).Run(count, interrupt);
+}
+
+size_t ResultCount(const CTempFolder& folder, size_t count)
+{
+    size_t results = 0;
+    for (size_t job = 0; job < count; ++job)
+        results += FileExists(folder.Path(std::to_string(job))) ? 1 : 0;
+    return results;
+}
+
+} // namespace
+
+TEST(CWorkerPool, EndsComeInOrderAndFewProcessesDoManyJobs)
+{
+    for (const size_t workers : {1u, 2u, 5u})
+    {
+        SCOPED_TRACE(workers);
+        const CTempFolder folder;
+        CDeeds deeds(std::vector(20, EDeed::Good), folder);
+        EXPECT_TRUE(RunDeeds(deeds, 20, workers, ECommit::AtOnce));
+        EXPECT_EQ(deeds.taken.size(), 20u);
+        EXPECT_TRUE(std::ranges::is_sorted(deeds.taken));
+        EXPECT_EQ(deeds.good, 20u);
+        std::ranges::sort(deeds.processes);
+        const auto rest = std::ranges::unique(deeds.processes);
+        EXPECT_LE(static_cast<size_t>(rest.begin() - deeds.processes.begin()), workers);
+    }
+}
+
+TEST(CWorkerPool, ALostJobCostsItselfOnly)
+{
+    const struct
+    {
+        const char* what;
+        EDeed deed;
+        EKind kind;
+    } rows[] = {
+        {"a signal",    EDeed::Crash, EKind::Died    },
+        {"a bare exit", EDeed::Exit,  EKind::Died    },
+        {"no end",      EDeed::Hang,  EKind::TimedOut},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CTempFolder folder;
+        CDeeds deeds(Deeds(12, 4, row.deed), folder);
+        EXPECT_TRUE(RunDeeds(deeds, 12, 2, ECommit::AtOnce, 2.0));
+        EXPECT_EQ(deeds.taken.size(), 12u);
+        EXPECT_EQ(deeds.kinds[4], row.kind);
+        EXPECT_EQ(deeds.lost, std::vector<size_t>{4});
+        EXPECT_EQ(deeds.good, 11u);
+        EXPECT_EQ(ResultCount(folder, 12), 11u);
+    }
+}
+
+TEST(CWorkerPool, ARunThatEndsLeavesWhatOneByOneLeaves)
+{
+    for (const EDeed deed : {EDeed::Bad, EDeed::Crash})
+    {
+        for (const size_t workers : {1u, 2u, 5u})
+        {
+            SCOPED_TRACE(workers);
+            const CTempFolder folder;
+            CDeeds deeds(Deeds(20, 6, deed), folder, false);
+            EXPECT_TRUE(RunDeeds(deeds, 20, workers, ECommit::InTurn));
+            EXPECT_EQ(deeds.taken, (std::vector<size_t>{0, 1, 2, 3, 4, 5, 6}));
+            EXPECT_EQ(ResultCount(folder, 20), deed == EDeed::Bad ? 7u : 6u);
+        }
+    }
+}
+
+TEST(CWorkerPool, ARequestToEndLetsFinishWhatIsUnderWay)
+{
+    const CTempFolder folder;
+    CDeeds deeds(Deeds(40, 5, EDeed::Interrupt), folder);
+    EXPECT_TRUE(RunDeeds(deeds, 40, 2, ECommit::AtOnce));
+    EXPECT_GE(deeds.taken.size(), 6u);
+    EXPECT_LT(deeds.taken.size(), 40u);
+    EXPECT_EQ(deeds.good, deeds.taken.size());
+    EXPECT_EQ(ResultCount(folder, 40), deeds.taken.size());
+    EXPECT_TRUE(deeds.lost.empty());
+}
+
+} // namespace gw

@@ -1,0 +1,143 @@
+// What a run keeps for the next one, and what it shows of itself.
+
+#include "CContentHash.h"
+#include "CProgressBar.h"
+#include "CReportFile.h"
+#include "CResumeState.h"
+#include "Paths.h"
+#include "TempFolder.h"
+
+#include <fstream>
+#include <gtest/gtest.h>
+
+namespace gw {
+
+namespace {
+
+void WriteText(const std::string& path, std::string_view text)
+{
+    std::ofstream(path, std::ios::binary) << text;
+}
+
+std::string ReadText(const std::string& path)
+{
+    std::ifstream file(path, std::ios::binary);
+    return {std::istreambuf_iterator<char>(file), {}};
+}
+
+} // namespace
+
+TEST(CContentHash, TellsApartWhichBytesBelongToWhat)
+{
+    const CTempFolder folder;
+    WriteText(folder.Path("ab"), "ab");
+    WriteText(folder.Path("empty"), "");
+    const std::string digits[] = {
+        CContentHash().AddText("ab").AddText("c").Digits(),
+        CContentHash().AddText("a").AddText("bc").Digits(),
+        CContentHash().AddText("abc").Digits(),
+        CContentHash().AddText("ab").Digits(),
+        CContentHash().AddFile(folder.Path("ab")).Digits(),
+        CContentHash().AddFile(folder.Path("empty")).Digits(),
+        CContentHash().AddFile(folder.Path("none")).Digits(),
+        CContentHash().Digits(),
+    };
+    for (size_t i = 0; i < std::size(digits); ++i)
+    {
+        EXPECT_EQ(digits[i].size(), 32u);
+        for (size_t j = 0; j < i; ++j)
+            EXPECT_NE(digits[i], digits[j]) << i << " and " << j;
+    }
+}
+
+TEST(CReportFile, HalfALineOfADeadWriterIsClosedFirst)
+{
+    const CTempFolder folder;
+    const struct
+    {
+        const char* what;
+        const char* before;
+        CReportFile::EStart start;
+        const char* after;
+    } rows[] = {
+        {"nothing there",  "",        CReportFile::EStart::AtEnd, "new\n"         },
+        {"whole lines",    "old\n",   CReportFile::EStart::AtEnd, "old\nnew\n"    },
+        {"half a line",    "old\nha", CReportFile::EStart::AtEnd, "old\nha\nnew\n"},
+        {"to be replaced", "old\nha", CReportFile::EStart::Empty, "new\n"         },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        WriteText(folder.Path("report"), row.before);
+        CReportFile report;
+        ASSERT_TRUE(report.Open(folder.Path("report"), row.start));
+        EXPECT_TRUE(report.AddLine("new"));
+        EXPECT_EQ(ReadText(folder.Path("report")), row.after); // at once, and not when it is closed
+    }
+    CReportFile full;
+    EXPECT_FALSE(full.Open("/dev/full", CReportFile::EStart::Empty) && full.AddLine("lost"));
+    EXPECT_FALSE(CReportFile().Open(folder.Path("none/report"), CReportFile::EStart::Empty));
+}
+
+TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
+{
+    const CTempFolder folder;
+    const std::string odd = "odd\xff\tname.Kinetra";
+    CResumeState first;
+    ASSERT_TRUE(first.Open(folder.Path(), "shard-0"));
+    EXPECT_TRUE(first.AddBegun("begun.Kinetra"));
+    EXPECT_TRUE(first.AddMade(odd, "key", "digits", R"("outcome":"converted")"));
+    CResumeState other;
+    ASSERT_TRUE(other.Open(folder.Path(), "shard-1"));
+    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "old digits", "old"));
+    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "digits", "new"));
+    WriteText(folder.Path(".gaitwright.resume.torn.jsonl"),
+              "{\"output\":\"torn.Kin\n[[[[\n\n17\n{\"output\":5,\"key\":\"key\"}\n");
+    WriteText(folder.Path("other.jsonl"), "{\"output\":\"strange.Kinetra\"}\n");
+
+    CResumeState next;
+    next.Read(folder.Path());
+    const auto told = [&](const std::string& output, const char* key, const char* digits) {
+        const std::string* text = next.FindTold(output, key, digits);
+        return text ? *text : std::string("nothing");
+    };
+    EXPECT_EQ(told(odd, "key", "digits"), R"("outcome":"converted")");
+    EXPECT_EQ(told("made.Kinetra", "key", "digits"), "new");
+    EXPECT_EQ(told("made.Kinetra", "key", "old digits"), "old");
+    EXPECT_EQ(told("made.Kinetra", "other key", "digits"), "nothing");
+    EXPECT_EQ(told("begun.Kinetra", "key", "digits"), "nothing");
+    EXPECT_TRUE(next.Knows("begun.Kinetra"));
+    EXPECT_TRUE(next.Knows(odd));
+    EXPECT_FALSE(next.Knows("torn.Kin"));
+    EXPECT_FALSE(next.Knows("strange.Kinetra"));
+}
+
+TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
+{
+    const struct
+    {
+        const char* what;
+        CProgress progress;
+        size_t width;
+        const char* line;
+    } rows[] = {
+        {"nothing known", {0, 8, 0, 0.0},       80, "[>                       ] 0/8"                              },
+        {"half",          {5, 10, 0, 2.5},      80, "[============>           ] 5/10  2.5/s  2s left"             },
+        {"minutes",       {0, 10000, 0, 100.0}, 80, "[>                       ] 0/10000  100.0/s  1m40s left"     },
+        {"hours",         {0, 10000, 0, 1.6},   80, "[>                       ] 0/10000  1.6/s  1h44m left"       },
+        {"failures",      {9, 10, 3, 1.0},      80, "[=====================>  ] 9/10  1.0/s  1s left, 3 failed"   },
+        {"the end",       {10, 10, 0, 4.0},     80, "[========================] 10/10  4.0/s  0s left"            },
+        {"no work",       {0, 0, 0, 0.0},       80, "[========================] 0/0"                              },
+        {"little room",   {5, 10, 0, 2.5},      10, "[========="                                                  },
+        {"all but never",
+         {0, 1000000, 0, 0.0001},
+         80,                                        "[>                       ] 0/1000000  0.0/s  277777h46m left"},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        EXPECT_EQ(ProgressLine(row.progress, row.width), row.line);
+    }
+}
+
+} // namespace gw
