@@ -38,6 +38,25 @@ struct ConversionChoices
     bool faithful = false; ///< hips, knees and feet keep to the source
 };
 
+/// What a batch run makes of the files of a folder.
+enum class EBatchJob : uint8_t
+{
+    ToMotion,    ///< of every source (.bvh) an .htr
+    ToContainer, ///< of every .htr an .orn
+};
+
+/// How a batch run goes on after a file.
+enum class EBatchStep : uint8_t
+{
+    Done,
+    Ended,     ///< the run ends with its summary
+    Abandoned, ///< the run ends at once and leaves its title
+};
+
+/// The extension of the files that a batch run takes, and that of its results.
+std::string_view BatchSource(EBatchJob job);
+std::string_view BatchResult(EBatchJob job);
+
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
 /// when they failed and 1 otherwise, also when a dialog was cancelled.
@@ -68,6 +87,11 @@ public:
     int RunBatch();
     /// The same, with the dialog beginning in a folder; an empty one means that of the last source.
     int RunBatch(const std::string& folder);
+    /// One file of a batch run, with its number from 0 on. Replaces what is there.
+    EBatchStep RunBatchFile(EBatchJob job, const std::string& source, const std::string& output, size_t index,
+                            size_t count);
+    /// The words at the end of a batch run that was not abandoned: how many files were done.
+    void TellBatch(EBatchJob job, size_t finished);
     /// What conversions from now on do beside the rules.
     void SetChoices(const ConversionChoices& choices);
     const ConversionChoices& Choices() const { return m_kChoices; }
@@ -147,7 +171,6 @@ public:
 
 private:
     struct Command;
-    enum class EBatchStep : uint8_t;
 
     // RecentFiles.cpp
     void AddRecentFile(const std::string& path);
@@ -191,8 +214,8 @@ private:
 
     // ConvertBatch.cpp
     void ShowBatchFile(const std::string& path, size_t index, size_t count);
-    EBatchStep ConvertFile(const std::string& path);
-    EBatchStep PackageFile(const std::string& path);
+    EBatchStep ConvertFile(const std::string& path, const std::string& output);
+    EBatchStep PackageFile(const std::string& path, const std::string& output);
     bool SelectProfileAgain();
 
     // ControlStates.cpp

@@ -22,13 +22,15 @@ constexpr float kPackageRate = 60.0f;
 
 } // namespace
 
-// How a run goes on after a file.
-enum class CGaitConvertContent::EBatchStep : uint8_t
+std::string_view BatchSource(EBatchJob job)
 {
-    Done,
-    Ended,     ///< the run ends with its summary
-    Abandoned, ///< the run ends at once and leaves its title
-};
+    return job == EBatchJob::ToMotion ? ".bvh" : ".htr";
+}
+
+std::string_view BatchResult(EBatchJob job)
+{
+    return job == EBatchJob::ToMotion ? ".htr" : ".orn";
+}
 
 int CGaitConvertContent::RunBatch()
 {
@@ -43,9 +45,9 @@ int CGaitConvertContent::RunBatch(const std::string& initialFolder)
         return 0;
     m_kWindow.RedrawFrame();
     const CWaitCursor wait(m_kWindow);
-    const bool toHtr = choice->filterIndex == 1;
+    const EBatchJob job = choice->filterIndex == 1 ? EBatchJob::ToMotion : EBatchJob::ToContainer;
     const std::string folder = WithSeparator(choice->folder);
-    const std::vector<std::string> names = FilesInFolder(folder, toHtr ? ".bvh" : ".htr");
+    const std::vector<std::string> names = FilesInFolder(folder, BatchSource(job));
     if (names.empty())
         return 0;
     EBatchStep step = EBatchStep::Done;
@@ -53,16 +55,27 @@ int CGaitConvertContent::RunBatch(const std::string& initialFolder)
     while (finished < names.size() && step == EBatchStep::Done)
     {
         const std::string path = folder + names[finished];
-        ShowBatchFile(path, finished, names.size());
-        step = toHtr ? ConvertFile(path) : PackageFile(path);
+        step = RunBatchFile(job, path, WithExtension(path, BatchResult(job)), finished, names.size());
         finished += step == EBatchStep::Done ? 1 : 0;
     }
     if (step == EBatchStep::Abandoned)
         return 0;
-    const int count[] = {static_cast<int>(finished)};
-    ShowMessage(toHtr ? kConvertedMessage : kPackagedMessage, EButtons::OK, count);
-    SetTitle({});
+    TellBatch(job, finished);
     return 1;
+}
+
+EBatchStep CGaitConvertContent::RunBatchFile(EBatchJob job, const std::string& source,
+                                             const std::string& output, size_t index, size_t count)
+{
+    ShowBatchFile(source, index, count);
+    return job == EBatchJob::ToMotion ? ConvertFile(source, output) : PackageFile(source, output);
+}
+
+void CGaitConvertContent::TellBatch(EBatchJob job, size_t finished)
+{
+    const int count[] = {static_cast<int>(finished)};
+    ShowMessage(job == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage, EButtons::OK, count);
+    SetTitle({});
 }
 
 void CGaitConvertContent::ShowBatchFile(const std::string& path, size_t index, size_t count)
@@ -74,7 +87,7 @@ void CGaitConvertContent::ShowBatchFile(const std::string& path, size_t index, s
     m_kWindow.StayPainted();
 }
 
-CGaitConvertContent::EBatchStep CGaitConvertContent::ConvertFile(const std::string& path)
+EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::string& output)
 {
     if (!LoadMotion(m_kSourceMotion, path))
     {
@@ -93,7 +106,7 @@ CGaitConvertContent::EBatchStep CGaitConvertContent::ConvertFile(const std::stri
     }
     Retarget(timing, true); // Shift has no say here
     m_kWriteRecord.Clear();
-    const bool saved = SaveMotion(WithExtension(path, ".htr"), kBatchRate);
+    const bool saved = SaveMotion(output, kBatchRate);
     Report(path, m_kWriteRecord);
     return saved ? EBatchStep::Done : EBatchStep::Ended;
 }
@@ -112,11 +125,10 @@ bool CGaitConvertContent::SelectProfileAgain()
     return true;
 }
 
-CGaitConvertContent::EBatchStep CGaitConvertContent::PackageFile(const std::string& path)
+EBatchStep CGaitConvertContent::PackageFile(const std::string& path, const std::string& output)
 {
     CFailureRecord record;
-    const bool packaged =
-        PackageMotion(path, WithExtension(path, ".orn"), kPackageRate, kPackageRate, record);
+    const bool packaged = PackageMotion(path, output, kPackageRate, kPackageRate, record);
     Report(path, record);
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
