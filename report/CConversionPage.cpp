@@ -1,7 +1,9 @@
 #include "CConversionPage.h"
 
-#include "CConversionSection.h"
+#include "CMarkup.h"
+#include "CPagePart.h"
 #include "CSafeFile.h"
+#include "KeyFigures.h"
 #include "PageStyle.h"
 #include "Paths.h"
 
@@ -10,49 +12,19 @@
 
 namespace gw {
 
-namespace {
-
-// Points of one curve: two for each pixel of a wide screen at most, and for many motions so few that a
-// thousand of them make some dozen megabytes.
-constexpr size_t kMostPoints = 2000;
-constexpr size_t kLeastPoints = 200;
-constexpr size_t kPointsOfPage = 40000;
-
-size_t PointsFor(size_t motionCount)
+void CConversionPage::Add(const std::string& source, const CPagePart& part)
 {
-    return std::clamp(kPointsOfPage / std::max<size_t>(motionCount, 1), kLeastPoints, kMostPoints);
-}
-
-std::string Anchor(size_t section)
-{
-    return "motion" + std::to_string(section);
-}
-
-} // namespace
-
-CConversionPage::CConversionPage(size_t motionCount) : m_uiMotionCount(motionCount) {}
-
-void CConversionPage::Add(const ConvertedMotion& motion)
-{
-    Row row;
-    row.source = motion.source;
-    row.frameCount = motion.measured->sums.frameCount;
-    row.figures = KeyFiguresOf(motion.measured->sums, motion.measured->detail);
-    row.badness = BadnessOf(row.figures);
-    row.section = ++m_uiSections;
-    CMarkup section;
-    CConversionSection(motion, PointsFor(m_uiMotionCount)).Append(section, Anchor(row.section));
-    m_kSections.Write(section.Text());
-    m_kRows.push_back(std::move(row));
+    ++m_uiSections;
+    m_kSections.Write(part.Section());
+    m_kRows.push_back({source, part.Row(), part.Badness()});
 }
 
 void CConversionPage::AddWithoutFigures(const std::string& source, const std::string& outcome)
 {
-    Row row;
-    row.source = source;
-    row.outcome = outcome;
-    row.badness = std::numeric_limits<double>::infinity();
-    m_kRows.push_back(std::move(row));
+    CMarkup row;
+    row.Raw("<tr><td class=\"word\">").FileName(source).Raw("</td><td class=\"word none\" colspan=\"");
+    row.Integer(static_cast<long long>(KeyFigureCount() + 1)).Raw("\">").Name(outcome).Raw("</td></tr>\n");
+    m_kRows.push_back({source, row.Text(), std::numeric_limits<double>::infinity()});
 }
 
 std::string CConversionPage::Head() const
@@ -74,28 +46,6 @@ std::string CConversionPage::Head() const
     return page.Text();
 }
 
-void CConversionPage::AppendSummaryRow(CMarkup& page, const Row& row)
-{
-    page.Raw("<tr><td class=\"word\">");
-    if (!row.outcome.empty())
-    {
-        page.FileName(row.source).Raw("</td><td class=\"word none\" colspan=\"");
-        page.Integer(static_cast<long long>(KeyFigureCount() + 1)).Raw("\">");
-        page.Name(row.outcome).Raw("</td></tr>\n");
-        return;
-    }
-    page.Raw("<a href=\"#").Raw(Anchor(row.section)).Raw("\">").FileName(row.source).Raw("</a></td><td>");
-    page.Integer(row.frameCount).Raw("</td>");
-    for (const KeyFigure& figure : row.figures)
-    {
-        page.Raw("<td class=\"").Raw(VerdictClass(figure.verdict)).Raw("\" title=\"");
-        page.Raw(VerdictWord(figure.verdict)).Raw("\"><em>").Raw(VerdictSign(figure.verdict)).Raw("</em> ");
-        AppendFigure(page, figure);
-        page.Raw("</td>");
-    }
-    page.Raw("</tr>\n");
-}
-
 void CConversionPage::AppendSummary(CMarkup& page) const
 {
     std::vector<const Row*> rows;
@@ -108,7 +58,7 @@ void CConversionPage::AppendSummary(CMarkup& page) const
         page.Raw("<th>").Raw(figure.label).Raw("</th>");
     page.Raw("</tr></thead><tbody>\n");
     for (const Row* row : rows)
-        AppendSummaryRow(page, *row);
+        page.Raw(row->markup);
     page.Raw("</tbody></table></div>\n<p class=\"about\">");
     for (const EVerdict verdict : {EVerdict::Good, EVerdict::Fair, EVerdict::Poor, EVerdict::None})
         page.Raw(VerdictSign(verdict)).Raw(" ").Raw(VerdictWord(verdict)).Raw("   ");

@@ -1,7 +1,6 @@
 #pragma once
 
 #include "CSpool.h"
-#include "KeyFigures.h"
 
 #include <cstddef>
 #include <string>
@@ -9,19 +8,16 @@
 
 namespace gw {
 
-struct ConvertedMotion;
+class CMarkup;
+class CPagePart;
 
 /// One self-contained page about conversions: it needs no script, no other file and no network. A page about
 /// several begins with a table of them, the worst one first.
 class CConversionPage
 {
 public:
-    /// `motionCount` is how many will come: the more, the coarser are the curves, so that a browser can open
-    /// the page.
-    explicit CConversionPage(size_t motionCount);
-
-    /// Takes a conversion in; its trees are posed anew.
-    void Add(const ConvertedMotion& motion);
+    /// Takes a conversion in that was drawn.
+    void Add(const std::string& source, const CPagePart& part);
     /// Takes in a source of which there is nothing to show; `outcome` is said in the table.
     void AddWithoutFigures(const std::string& source, const std::string& outcome);
 
@@ -35,18 +31,13 @@ private:
     struct Row
     {
         std::string source;
-        std::string outcome; // empty for a conversion that was measured
-        int frameCount = 0;
-        std::vector<KeyFigure> figures;
+        std::string markup;
         double badness = 0.0;
-        size_t section = 0;
     };
 
     std::string Head() const;
     void AppendSummary(CMarkup& page) const;
-    static void AppendSummaryRow(CMarkup& page, const Row& row);
 
-    size_t m_uiMotionCount;
     std::vector<Row> m_kRows;
     size_t m_uiSections = 0;
     CSpool m_kSections;

@@ -58,6 +58,13 @@ public:
                 throw CLI::ValidationError(Quoted(text) + " is no integer");
         });
     }
+    CLI::Option* operator()(std::optional<int64_t> COptions::*target) const
+    {
+        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+            if (!ScanInteger(text, number->emplace()) || **number < 0)
+                throw CLI::ValidationError(Quoted(text) + " is no whole number");
+        });
+    }
     CLI::Option* operator()(CPixelSize COptions::*target) const
     {
         return Add([size = &(m_kOptions.*target)](const std::string& text) {
@@ -206,7 +213,7 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
         return RefuseFor(command, Printable(wrong));
     if (command.choice && CountChosen(app, command) != 1)
         return RefuseFor(command, std::string(command.name) + " needs one of " + ChoiceText(command));
-    if (options.files.size() < LeastOperands(command))
+    if (options.files.size() < LeastOperands(command) && options.filesFrom.empty())
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
     if (options.files.size() > MostOperands(command))
         return RefuseFor(command, "one argument too many: " + Quoted(options.files[MostOperands(command)]));

@@ -43,6 +43,9 @@ public:
     bool SelectFittingProfile(const std::string& source, std::optional<CProfileFit>& nearest);
     /// What was selected so; nothing for a profile that was named.
     const std::optional<ProfileChoice>& Chosen() const { return m_kChosen; }
+    /// The file of the selected profile, as it may be told: an adapted one lies in a file that is gone when
+    /// this is read, and is told as the one that it was made of.
+    std::string ToldProfilePath() { return m_kChosen ? m_kChosen->path : ProfilePath(); }
     /// How a profile fits the open source. False when its file cannot be read.
     bool Measure(const std::string& profilePath, CProfileFit& fit) const;
 

@@ -7,17 +7,28 @@ namespace gw {
 namespace {
 
 // Rows are calls, which the formatter leaves as they are read.
-constexpr CCommand Row(std::string_view name, std::string_view operands, uint32_t options, uint32_t required,
+constexpr CCommand Row(std::string_view name, std::string_view operands, uint64_t options, uint64_t required,
                        EExit (*run)(const COptions&), std::string_view help, std::string_view example,
-                       uint32_t choice = 0)
+                       uint64_t choice = 0)
 {
     return {name, operands, options, required, run, help, example, choice};
 }
 
-constexpr uint32_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |
-                                     kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml;
+// Of a run over many files.
+constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit;
 
-constexpr uint32_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
+constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |
+                                     kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml |
+                                     kManyOptions;
+
+constexpr uint64_t kBatchOptions = kJob | kProfile | kOutputFolder | kKeepGoing | kManyOptions;
+
+// What of a conversion is decided when it is planned; the rest is said where it is run.
+constexpr uint64_t kPlanOptions =
+    (kConvertOptions & ~(kSkipExisting | kDryRun | kKeepGoing | kHtml | kManyOptions)) | kFilesFrom | kNull |
+    kShards;
+
+constexpr uint64_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
 
 constexpr CCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
@@ -26,17 +37,35 @@ constexpr CCommand kCommands[] = {
         "rows must fit, most rows win. It is told which one and how sure it is; one whose left and right,\n"
         "or whose arm and clavicle, lie wrong is only taken by its name. A prefix that the names of the\n"
         "source share (Model_, mixamorig3:) is put before those of the profile.\n"
-        "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir.\n"
+        "OUT may end in .htr for the motion file alone. Several sources, or a folder, need --out-dir, where\n"
+        "results lie as their sources lie below their folder. Many files are converted by several\n"
+        "processes: one that crashes or hangs costs its own file only. Without --keep-going the first\n"
+        "failure ends the run; what it leaves and says is the same for any number of processes.\n"
         "With --align the source is first told from a T-pose, as by 'gaitwright align', and every mapped\n"
         "bone points as its source does: of the profile only the names count, since its rotations and axes\n"
         "were made against the source's own rest pose.\n"
         "--check measures each result and names its worst frames; --html PAGE writes all of that as a page\n"
         "for a browser, of several sources with a table that begins with the worst.",
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
-    Row("batch", "FOLDER", kJob | kProfile, kJob, RunBatchFolder,
+    Row("batch", "FOLDER", kBatchOptions, kJob, RunBatchFolder,
         "Convert every .bvh of a folder to an .htr beside it, or package every .htr.\n"
-        "Packages are written as .orn. Files that exist are replaced; the first failure ends the run.",
+        "Packages are written as .orn. Files that exist are replaced; the first failure ends the run. With\n"
+        "--out-dir the folders below are converted too, and the results lie there in the same tree.",
         "gaitwright batch takes --job htr --profile \"Poser BVH\""),
+    Row("plan", "SOURCE...", kPlanOptions, kOutput | kShards, RunPlan,
+        "Divide a run over many files into shards, for several machines or tasks.\n"
+        "Shards are about equally much work. Without --out-dir results go beside their sources. Relative\n"
+        "paths count from where 'gaitwright run' is started. A run goes on behind sources that fail.",
+        "gaitwright plan archive --shards 8 -o plan.jsonl --out-dir results"),
+    Row("run", "PLAN", kForce | kJobs | kReport | kTimeLimit | kShard, kShard, RunShard,
+        "Convert one shard of a plan; started again, it does what is left.\n"
+        "The report goes beside the plan unless told: plan.shard-3.jsonl.",
+        "gaitwright run plan.jsonl --shard 3"),
+    Row("merge-report", "PLAN [REPORT...]", kOutput | kForce, 0, RunMergeReport,
+        "Join the reports of all shards in the order of the plan; say and answer what one run would.\n"
+        "Without REPORT those beside the plan are taken. Without -o the lines go to standard output. A\n"
+        "source without a line is left: run its shard again.",
+        "gaitwright merge-report plan.jsonl -o report.jsonl"),
     Row("info", "FILE", 0, 0, RunInfo,
         "Show what a motion or a container holds: format, frames, rate, bones, objects.",
         "gaitwright info walk.bvh"),
@@ -108,12 +137,13 @@ size_t CountWords(std::string_view text)
 
 size_t LeastOperands(const CCommand& command)
 {
-    return command.operands.starts_with('[') ? 0 : CountWords(command.operands);
+    const auto optional = std::ranges::count(command.operands, '[');
+    return CountWords(command.operands) - static_cast<size_t>(optional);
 }
 
 size_t MostOperands(const CCommand& command)
 {
-    return command.operands.ends_with("...") ? SIZE_MAX : CountWords(command.operands);
+    return command.operands.find("...") != command.operands.npos ? SIZE_MAX : CountWords(command.operands);
 }
 
 std::span<const CCommand> Commands()

@@ -1,5 +1,6 @@
 #include "BonePairs.h"
 #include "CConversionPage.h"
+#include "CPagePart.h"
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CKeyframeControl.h"
@@ -113,8 +114,10 @@ bool WriteComparison(const COptions& options, const std::string& profilePath, co
     motion.sourceClip = source;
     motion.resultClip = result;
     motion.measured = &measured;
-    CConversionPage page(1);
-    page.Add(motion);
+    CPagePart part(1, 1);
+    part.Show(motion);
+    CConversionPage page;
+    page.Add(motion.source, part);
     return WritePage(options, page);
 }
 

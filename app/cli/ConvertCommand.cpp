@@ -1,24 +1,20 @@
 #include "CConversionPage.h"
-#include "CJsonWriter.h"
+#include "CConversionRun.h"
+#include "CPagePart.h"
 #include "Commands.h"
-#include "ConvertFile.h"
+#include "ConversionJobs.h"
 #include "Output.h"
 #include "PageOutput.h"
 #include "Paths.h"
-#include "PrivateNames.h"
+#include "RunSetup.h"
 #include "Text.h"
 #include "Words.h"
 
-#include <array>
-#include <cstdio>
 #include <optional>
-#include <unordered_set>
 
 namespace gw {
 
 namespace {
-
-using Jobs = std::vector<CConversionJob>;
 
 bool Refuse(const std::string& words)
 {
@@ -40,145 +36,90 @@ bool ResolveOutput(std::string& output)
     return true;
 }
 
-std::string OutputOf(const std::string& source, const std::string& folder)
+bool PlanOne(const COptions& options, CFileRun::Jobs& jobs)
 {
-    return folder + SplitPath(source).stem + ".Kinetra";
-}
-
-bool PlanOne(const COptions& options, Jobs& jobs)
-{
+    if (options.resume)
+        return Refuse("--resume is for many files; it needs --out-dir DIR");
     const std::string& source = options.files[0];
     std::string output = options.output;
     if (output.empty())
-        output = OutputOf(source, SplitPath(source).folder);
+        output = SplitPath(source).folder + SplitPath(source).stem + ".Kinetra";
     if (!ResolveOutput(output))
         return false;
     jobs.push_back({source, output});
     return true;
 }
 
-// What the open dialog would show of a folder.
-void AddFolder(const std::string& source, std::vector<std::string>& sources)
+bool IsOne(const COptions& options)
 {
-    const std::string folder = WithSeparator(source);
-    for (const char* extension : {".bvh", ".orn"})
-    {
-        for (const std::string& name : FilesInFolder(folder, extension))
-            sources.push_back(folder + name);
-    }
+    return options.files.size() == 1 && options.filesFrom.empty() && options.outputFolder.empty() &&
+           !FolderExists(options.files[0]);
 }
 
-bool PlanMany(const COptions& options, Jobs& jobs)
+// In this process: a crash costs nothing else.
+EExit RunOne(const COptions& options, const CConversionJob& job)
+{
+    std::optional<CPagePart> part;
+    if (IsPageAsked(options))
+        part.emplace(1, 1);
+    const EConversion outcome = ConvertFile(options, job, nullptr, part ? &*part : nullptr);
+    bool isWritten = true;
+    if (part && part->HasFigures())
+    {
+        CConversionPage page;
+        page.Add(job.source, *part);
+        isWritten = WritePage(options, page);
+    }
+    return outcome == EConversion::Failed || !isWritten ? EExit::Failed : EExit::Done;
+}
+
+EExit ConvertOne(const COptions& options)
+{
+    CFileRun::Jobs jobs;
+    if (!PlanOne(options, jobs))
+        return EExit::Usage;
+    if (!HasPageFolder(options))
+        return EExit::Failed;
+    return options.report.empty() ? RunOne(options, jobs[0]) : CConversionRun(options, jobs, {}).RunAll();
+}
+
+bool IsManyPossible(const COptions& options)
 {
     if (options.outputFolder.empty())
         return Refuse("several sources, or a folder, need --out-dir DIR");
     if (!options.output.empty())
         return Refuse("-o names a single file; with --out-dir every result takes the name of its source");
-    std::vector<std::string> sources;
-    for (const std::string& file : options.files)
-    {
-        if (FolderExists(file))
-            AddFolder(file, sources);
-        else
-            sources.push_back(file);
-    }
-    std::unordered_set<std::string> outputs;
-    for (const std::string& source : sources)
-    {
-        jobs.push_back({source, OutputOf(source, WithSeparator(options.outputFolder))});
-        if (!outputs.insert(jobs.back().output).second)
-            return Refuse(Printable(source) + ": another source becomes " + Printable(jobs.back().output) +
-                          " too");
-    }
     return true;
 }
 
-bool Plan(const COptions& options, Jobs& jobs)
+EExit ConvertMany(const COptions& options)
 {
-    if (!IsDecidedOnExisting(options))
-        return false;
-    const bool isOne =
-        options.files.size() == 1 && options.outputFolder.empty() && !FolderExists(options.files[0]);
-    return isOne ? PlanOne(options, jobs) : PlanMany(options, jobs);
-}
-
-// How many jobs came to each end, by EConversion.
-using Tally = std::array<size_t, 4>;
-
-size_t Count(const Tally& tally, EConversion outcome)
-{
-    return tally[static_cast<size_t>(outcome)];
-}
-
-void TellTally(const COptions& options, const Tally& tally, size_t left)
-{
-    const size_t converted = Count(tally, EConversion::Converted) + Count(tally, EConversion::Planned);
-    const size_t skipped = Count(tally, EConversion::Skipped);
-    const size_t failed = Count(tally, EConversion::Failed);
-    if (!options.json)
+    CFileRun::Jobs jobs;
+    if (!IsManyPossible(options))
+        return EExit::Usage;
+    if (!ListConversions(options, jobs))
+        return EExit::Failed;
+    if (!AreOutputsApart(jobs))
+        return EExit::Usage;
+    if (jobs.empty())
     {
-        SayWord(options, std::to_string(converted) + (options.dryRun ? " to convert, " : " converted, ") +
-                             std::to_string(skipped) + " skipped, " + std::to_string(failed) + " failed, " +
-                             std::to_string(left) + " left");
-        return;
+        SayError("there is no .bvh and no .orn to convert");
+        return EExit::Failed;
     }
-    CJsonWriter json(stdout);
-    json.BeginObject();
-    json.Key("converted").Integer(static_cast<int64_t>(converted));
-    json.Key("skipped").Integer(static_cast<int64_t>(skipped));
-    json.Key("failed").Integer(static_cast<int64_t>(failed));
-    json.Key("left").Integer(static_cast<int64_t>(left));
-    json.EndObject();
-    json.EndDocument();
-}
-
-EExit RunJobs(const COptions& options, const Jobs& jobs)
-{
-    Tally tally{};
-    size_t done = 0;
-    std::optional<CConversionPage> page;
-    if (!options.html.empty() && !options.dryRun)
-        page.emplace(jobs.size());
-    for (; done < jobs.size() && (options.keepGoing || Count(tally, EConversion::Failed) == 0); ++done)
-        ++tally[static_cast<size_t>(ConvertFile(options, jobs[done], page ? &*page : nullptr))];
-    if (!options.outputFolder.empty())
-        TellTally(options, tally, jobs.size() - done);
-    for (size_t left = done; page && left < jobs.size(); ++left)
-        page->AddWithoutFigures(jobs[left].source, "left");
-    const bool isWritten = !page || !page->HasConversions() || WritePage(options, *page);
-    return Count(tally, EConversion::Failed) == 0 && isWritten ? EExit::Done : EExit::Failed;
-}
-
-// The folder of the results is made where it is missing; a page may lie in it.
-bool PrepareFolders(const COptions& options)
-{
-    if (options.dryRun)
-        return true;
-    if (!options.outputFolder.empty() && !CreateFolder(options.outputFolder))
-    {
-        SayError(Printable(options.outputFolder) + ": the folder cannot be made");
-        return false;
-    }
-    if (!options.outputFolder.empty())
-        RemoveLeftovers(options.outputFolder);
-    return HasPageFolder(options);
+    if (!MakeOutputFolder(options) || !HasPageFolder(options)) // which may be the same
+        return EExit::Failed;
+    return CConversionRun(options, jobs, StateOf(options)).RunAll();
 }
 
 } // namespace
 
 EExit RunConvert(const COptions& options)
 {
-    Jobs jobs;
-    if (!Plan(options, jobs))
+    if (!IsDecidedOnExisting(options) || !IsRunPossible(options))
         return EExit::Usage;
     if (const EExit page = CheckPagePath(options); page != EExit::Done)
         return page;
-    if (jobs.empty())
-    {
-        SayError("there is no .bvh and no .orn to convert");
-        return EExit::Failed;
-    }
-    return PrepareFolders(options) ? RunJobs(options, jobs) : EExit::Failed;
+    return IsOne(options) ? ConvertOne(options) : ConvertMany(options);
 }
 
 } // namespace gw

@@ -1,9 +1,9 @@
 #include "ConvertFile.h"
 
 #include "CBoneMapProfile.h"
-#include "CConversionPage.h"
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
+#include "CPagePart.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
 #include "CheckReport.h"
@@ -36,6 +36,7 @@ struct Account
     std::optional<MeasuredConversion> check;
     std::optional<MeasuredConversion> plainCheck; // of the same motion by the plain rules
     std::optional<ProfileChoice> chosen; ///< a profile that was neither named nor the stock one of old
+    const char* whySkipped = "the output exists";
 };
 
 // One run of the state machine, step by step. Each step answers whether the next may follow.
@@ -43,8 +44,8 @@ class CConversion
 {
 public:
     CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
-                CConversionPage* page)
-        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account), m_pkPage(page),
+                CPagePart* part)
+        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account), m_pkPart(part),
           m_kPlatform(EPlatformWriting::No, options.dataFolder), m_kContent(window, m_kPlatform)
     {
         window.SetPaths(job.source, job.output);
@@ -59,7 +60,7 @@ public:
             return EConversion::Planned;
         if (!Convert() || !Save())
             return EConversion::Failed;
-        if (m_kOptions.check || m_pkPage)
+        if (m_kOptions.check || m_pkPart)
             Check();
         return EConversion::Converted;
     }
@@ -78,7 +79,7 @@ private:
     const CConversionJob& m_kJob;
     CShellWindow& m_kWindow;
     Account& m_kAccount;
-    CConversionPage* m_pkPage; // null where none is asked for
+    CPagePart* m_pkPart; // null where no page is asked for
     CFilePlatform m_kPlatform;
     CShellContent m_kContent;
 };
@@ -92,8 +93,7 @@ bool CConversion::SelectProfile()
         return false;
     m_kContent.Profile()->GetProfileName(m_kAccount.profile);
     m_kAccount.chosen = m_kContent.Chosen();
-    // An adapted profile lies in a file that is gone when this is read.
-    m_kAccount.profilePath = m_kAccount.chosen ? m_kAccount.chosen->path : m_kContent.ProfilePath();
+    m_kAccount.profilePath = m_kContent.ToldProfilePath();
     return true;
 }
 
@@ -135,8 +135,8 @@ void CConversion::Check()
     motion.profile = m_kAccount.profile;
     motion.measured = &*m_kAccount.check;
     motion.plain = m_kAccount.plainCheck ? &*m_kAccount.plainCheck : nullptr;
-    if (m_pkPage)
-        m_pkPage->Add(motion);
+    if (m_pkPart)
+        m_pkPart->Show(motion);
 }
 
 void CConversion::KeepMisfit()
@@ -147,13 +147,13 @@ void CConversion::KeepMisfit()
 }
 
 EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
-                   CConversionPage* page)
+                   CPagePart* part)
 {
     if (options.skipExisting && IsTaken(job.output))
         return EConversion::Skipped;
     const std::optional<CReport> refusal = WhyNotWrite(options, job.output);
     if (!refusal)
-        return CConversion(options, job, window, account, page).Run();
+        return CConversion(options, job, window, account, part).Run();
     window.Report(*refusal);
     return EConversion::Failed;
 }
@@ -191,7 +191,7 @@ void Print(const CConversionJob& job, const Account& account)
 {
     const std::string paths = Printable(job.source) + " -> " + Printable(job.output);
     if (account.outcome == EConversion::Skipped)
-        std::printf("%s: skipped, the output exists\n", paths.c_str());
+        std::printf("%s: skipped, %s\n", paths.c_str(), account.whySkipped);
     else if (account.outcome == EConversion::Planned)
         std::printf("%s: would be converted by profile %s\n", paths.c_str(), ProfileWords(account).c_str());
     else if (account.outcome == EConversion::Converted)
@@ -199,14 +199,14 @@ void Print(const CConversionJob& job, const Account& account)
                     ProfileWords(account).c_str());
 }
 
-void WriteJson(const COptions& options, const CConversionJob& job, const Account& account,
+void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& job, const Account& account,
                const CShellWindow& window)
 {
-    CJsonWriter json(stdout);
+    CJsonWriter json(file);
     json.BeginObject();
     json.Key("source").Text(job.source);
     json.Key("output").Text(job.output);
-    json.Key("outcome").Text(kOutcomeNames[static_cast<size_t>(account.outcome)]);
+    json.Key("outcome").Text(OutcomeName(account.outcome));
     json.Key("profile").Text(account.profile);
     json.Key("profilePath").Text(account.profilePath);
     json.Key("frames").Integer(account.frames);
@@ -225,28 +225,50 @@ void WriteJson(const COptions& options, const CConversionJob& job, const Account
     json.EndDocument();
 }
 
-std::string OutcomeWords(EConversion outcome)
+void Tell(const COptions& options, const CConversionJob& job, const Account& account,
+          const CShellWindow& window, std::FILE* record)
 {
-    return outcome == EConversion::Converted ? "converted, and could not be measured"
-                                             : kOutcomeNames[static_cast<size_t>(outcome)];
+    if (record)
+        WriteJson(record, options, job, account, window);
+    if (options.json)
+        WriteJson(stdout, options, job, account, window);
+    if (options.json || options.quiet)
+        return;
+    Print(job, account);
+    if (options.check)
+        PrintChecks(account);
 }
 
 } // namespace
 
-EConversion ConvertFile(const COptions& options, const CConversionJob& job, CConversionPage* page)
+const char* OutcomeName(EConversion outcome)
+{
+    return kOutcomeNames[static_cast<size_t>(outcome)];
+}
+
+EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
+                        CPagePart* part)
 {
     CShellWindow window(options);
     Account account;
-    account.outcome = Decide(options, job, window, account, page);
-    if (page && !account.check)
-        page->AddWithoutFigures(job.source, OutcomeWords(account.outcome));
-    if (options.json)
-        WriteJson(options, job, account, window);
-    else if (!options.quiet)
-        Print(job, account);
-    if (options.check && !options.json && !options.quiet)
-        PrintChecks(account);
+    account.outcome = Decide(options, job, window, account, part);
+    Tell(options, job, account, window, record);
     return account.outcome;
+}
+
+void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record)
+{
+    CShellWindow window(options);
+    window.Report(reason);
+    Tell(options, job, {}, window, record);
+}
+
+void TellSkipped(const COptions& options, const CConversionJob& job, const char* why)
+{
+    Account account;
+    account.outcome = EConversion::Skipped;
+    account.whySkipped = why;
+    Tell(options, job, account, CShellWindow(options), nullptr);
 }
 
 } // namespace gw

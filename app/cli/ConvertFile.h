@@ -3,12 +3,14 @@
 #include "COptions.h"
 
 #include <cstdint>
+#include <cstdio>
 #include <string>
 #include <vector>
 
 namespace gw {
 
-class CConversionPage;
+class CPagePart;
+struct CReport;
 
 /// One source and the file that becomes of it.
 struct CConversionJob
@@ -25,9 +27,19 @@ enum class EConversion : uint8_t
     Failed,
 };
 
+/// "converted", "failed", ...
+const char* OutcomeName(EConversion outcome);
+
 /// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Tells the result
 /// on standard output and everything else on standard error. Each has a state machine of its own, so that
-/// nothing of one source stays for the next. `page`, where there is one, takes the conversion in.
-EConversion ConvertFile(const COptions& options, const CConversionJob& job, CConversionPage* page);
+/// nothing of one source stays for the next. A record, unless it is null, takes what --json tells, and a part
+/// of a page the conversion's pictures and figures.
+EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
+                        CPagePart* part);
+
+/// Tells in the same way of a conversion that came to nothing, for a reason that it could not tell itself.
+void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record);
+/// And of one that is not made.
+void TellSkipped(const COptions& options, const CConversionJob& job, const char* why);
 
 } // namespace gw

@@ -4,7 +4,7 @@ namespace gw {
 
 namespace {
 
-constexpr uint32_t kEverywhere = kDataFolder | kJson | kQuiet;
+constexpr uint64_t kEverywhere = kDataFolder | kJson | kQuiet;
 
 constexpr COptionRow Row(EOption bit, std::string_view names, std::string_view value, COptionTarget target,
                          std::string_view help, std::string_view choices = {})
@@ -42,6 +42,18 @@ constexpr COptionRow kOptions[] = {
     Row(kHtml, "--html", "PAGE", &COptions::html,
         "write a page with figures, curves over time and the worst frames"),
     Row(kKeepGoing, "--keep-going", "", &COptions::keepGoing, "go on with the next source where one fails"),
+    Row(kResume, "--resume", "", &COptions::resume,
+        "pass over a source whose output stands as an earlier --resume run made it"),
+    Row(kJobs, "--jobs", "N", &COptions::jobs, "worker processes; as many as there are cores unless told"),
+    Row(kTimeLimit, "--time-limit", "S", &COptions::timeLimit,
+        "seconds after which a source that hangs is given up; 600 unless told"),
+    Row(kFilesFrom, "--files-from", "LIST", &COptions::filesFrom,
+        "a file with a source on each line, - for standard input"),
+    Row(kNull, "-0,--null", "", &COptions::nullSeparated, "the list has zero bytes between its names"),
+    Row(kReport, "--report", "FILE", &COptions::report,
+        "write a line of JSON for every source, in their order"),
+    Row(kShards, "--shards", "K", &COptions::shards, "how many parts, for as many machines or more"),
+    Row(kShard, "--shard", "I", &COptions::shard, "which part, from 0 on"),
     Row(kDryRun, "--dry-run", "", &COptions::dryRun, "say what would be done, and write nothing"),
     Row(kDataFolder, "--data-dir", "DIR", &COptions::dataFolder,
         "the folder of base.htr, KsBone.bsm and the stock profiles, in place of the program's own"),
@@ -79,7 +91,7 @@ std::span<const COptionRow> OptionTable()
     return kOptions;
 }
 
-uint32_t OptionsOf(const CCommand& command)
+uint64_t OptionsOf(const CCommand& command)
 {
     return command.options | kEverywhere;
 }
@@ -118,7 +130,7 @@ std::string ProgramHelp()
     for (const CCommand& command : Commands())
         AppendRow(text, command.name, FirstLine(command.help));
     text += "\n'gaitwright COMMAND --help' shows the options of a command and an example.\n"
-            "Exit codes: 0 done, 1 some work failed, 2 wrong usage.\n\nExample:\n  ";
+            "Exit codes: 0 done, 1 some work failed, 2 wrong usage, 130 interrupted.\n\nExample:\n  ";
     return text + std::string(Commands().front().example) + '\n';
 }
 

@@ -8,10 +8,10 @@
 namespace gw {
 
 /// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, any number,
-/// an integer, a size.
-using COptionTarget =
-    std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
-                 std::optional<float> COptions::*, int64_t COptions::*, CPixelSize COptions::*>;
+/// an integer, a whole number from 0 on, a size.
+using COptionTarget = std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
+                                   std::optional<float> COptions::*, int64_t COptions::*,
+                                   std::optional<int64_t> COptions::*, CPixelSize COptions::*>;
 
 /// One option of the program.
 struct COptionRow
@@ -28,7 +28,7 @@ struct COptionRow
 std::span<const COptionRow> OptionTable();
 
 /// The bits of all options that a command takes.
-uint32_t OptionsOf(const CCommand& command);
+uint64_t OptionsOf(const CCommand& command);
 
 /// The help of the program: every command with a line.
 std::string ProgramHelp();

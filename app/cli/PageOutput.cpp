@@ -24,7 +24,7 @@ EExit CheckPagePath(const COptions& options)
 bool HasPageFolder(const COptions& options)
 {
     const std::string folder = SplitPath(options.html).folder;
-    if (folder.empty() || FolderExists(folder))
+    if (options.dryRun || folder.empty() || FolderExists(folder))
         return true;
     SayError(Printable(options.html) + ": there is no such folder");
     return false;

@@ -6,6 +6,12 @@ namespace gw {
 
 class CConversionPage;
 
+/// Whether a page is to be written.
+inline bool IsPageAsked(const COptions& options)
+{
+    return !options.html.empty() && !options.dryRun;
+}
+
 /// Whether --html names a page that may be written; Done without one. Says what is wrong: a page ends in
 /// .html or .htm, so that a slip replaces no motion, and one that exists wants --force.
 EExit CheckPagePath(const COptions& options);

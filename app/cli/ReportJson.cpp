@@ -4,6 +4,7 @@
 #include "CJsonWriter.h"
 #include "CReport.h"
 #include "FailureWords.h"
+#include "JsonText.h"
 
 namespace gw {
 
@@ -18,6 +19,20 @@ void WriteReport(CJsonWriter& json, const CReport& report)
     json.Key("name").Text(report.name);
     json.Key("words").Text(report.words);
     json.EndObject();
+}
+
+CReport ReadReport(const nlohmann::ordered_json& json, bool warning)
+{
+    CReport report;
+    report.warning = warning;
+    TakeText(json, "path", report.path);
+    TakeText(json, "code", report.code);
+    TakeText(json, "name", report.name);
+    TakeText(json, "words", report.words);
+    const auto where = json.is_object() ? json.find("where") : json.end();
+    if (where != json.end() && where->is_number_unsigned())
+        report.where = where->get<size_t>();
+    return report;
 }
 
 } // namespace
@@ -44,6 +59,18 @@ void WriteRecord(CJsonWriter& json, const std::string& path, const CFailureRecor
     for (const CFailure& warning : record.Warnings())
         reports.push_back(MakeReport(path, warning, true));
     WriteReports(json, reports);
+}
+
+bool ReadReports(std::string_view text, std::vector<CReport>& reports)
+{
+    const auto json = nlohmann::ordered_json::parse(text, nullptr, false);
+    for (const bool warning : {false, true})
+    {
+        const auto found = json.is_object() ? json.find(warning ? "warnings" : "failures") : json.end();
+        for (size_t i = 0; found != json.end() && found->is_array() && i < found->size(); ++i)
+            reports.push_back(ReadReport((*found)[i], warning));
+    }
+    return json.is_object();
 }
 
 } // namespace gw

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace gw {
@@ -13,5 +14,8 @@ struct CReport;
 void WriteReports(CJsonWriter& json, const std::vector<CReport>& reports);
 /// What a reader kept, as the same members.
 void WriteRecord(CJsonWriter& json, const std::string& path, const CFailureRecord& record);
+/// Takes the reports back out of an object with those members, behind what is there already. False where the
+/// text is no JSON object.
+bool ReadReports(std::string_view text, std::vector<CReport>& reports);
 
 } // namespace gw

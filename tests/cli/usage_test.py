@@ -3,8 +3,8 @@ import shlex
 
 from harness import DONE, FAILED, USAGE, CliTest, main
 
-COMMANDS = ("convert", "batch", "info", "pose", "transcode", "resave", "extract", "package", "profiles", "compare",
-            "render", "dump", "suggest")
+COMMANDS = ("convert", "batch", "plan", "run", "merge-report", "info", "pose", "transcode", "resave", "extract",
+            "package", "profiles", "compare", "render", "dump", "suggest")
 
 WRONG = [  # what, arguments, words on standard error
     ("no command", "", ["a command is missing", "--help"]),

@@ -1,6 +1,7 @@
 // What stands in a page, whatever the names and the numbers of a motion.
 
 #include "CConversionPage.h"
+#include "CPagePart.h"
 #include "CMadeFigure.h"
 #include "CMarkup.h"
 #include "ConvertedMotion.h"
@@ -45,9 +46,18 @@ public:
 
     std::string Page() const
     {
-        CConversionPage page(1);
-        page.Add(m_kMotion);
+        CConversionPage page;
+        AddTo(page, 1, 1);
         return Written(page);
+    }
+    // By way of text, as from another process.
+    void AddTo(CConversionPage& page, size_t number, size_t motionCount) const
+    {
+        CPagePart part(number, motionCount);
+        part.Show(m_kMotion);
+        CPagePart received(number, motionCount);
+        EXPECT_TRUE(received.FromText(part.ToText()));
+        page.Add(m_kMotion.source, received);
     }
     static std::string Written(CConversionPage& page)
     {
@@ -208,9 +218,9 @@ TEST(Page, SeveralMotionsBeginWithATableOfTheWorst)
     CMadeConversion poor(bad);
     good.Motion().source = "good.bvh";
     poor.Motion().source = "poor.bvh";
-    CConversionPage page(3);
-    page.Add(good.Motion());
-    page.Add(poor.Motion());
+    CConversionPage page;
+    good.AddTo(page, 1, 3);
+    poor.AddTo(page, 2, 3);
     page.AddWithoutFigures("broken.bvh", "failed");
     const std::string text = CMadeConversion::Written(page);
     ExpectBalanced(text);
@@ -235,8 +245,8 @@ TEST(Page, SetsTheChoicesAgainstThePlainRules)
 TEST(Page, IsWrittenInFullOrNotAtAll)
 {
     const CTempFolder folder;
-    CConversionPage page(1);
-    page.Add(CMadeConversion(kStill).Motion());
+    CConversionPage page;
+    CMadeConversion(kStill).AddTo(page, 1, 1);
     EXPECT_FALSE(page.Write(folder.Path("gone/page.html")));
     EXPECT_FALSE(page.Write(folder.Path()));
     EXPECT_TRUE(page.Write(folder.Path("page.html")));

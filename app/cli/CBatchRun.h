@@ -1,0 +1,48 @@
+#pragma once
+
+#include "CFileRun.h"
+#include "CGaitConvertContent.h"
+#include "CReport.h"
+
+namespace gw {
+
+class CShellContent;
+class CShellWindow;
+
+/// The folder run of the desktop program: one profile for all, chosen before it begins, and its own words.
+/// Every worker has the conversion as it stands then.
+class CBatchRun : public CFileRun
+{
+public:
+    /// Content and window must outlive the run, and so must the options.
+    CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellContent& content,
+              CShellWindow& window);
+
+    /// Everything that was reported of the files, in order.
+    const std::vector<CReport>& Reports() const { return m_kReports; }
+    /// Number of files that were taken up.
+    size_t TakenCount() const { return m_uiTaken; }
+
+protected:
+    CFileEnd Convert(const COptions& options, size_t index, std::FILE* record) override;
+    void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
+    void TellUpToDate(size_t index) override;
+    bool AddProfiles(CContentHash& key) override;
+    void TakeRecord(size_t index, EConversion outcome, std::string_view record,
+                    std::string_view enclosure) override;
+    bool TellEnd() override;
+
+private:
+    EBatchJob Job() const;
+    void WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports, std::FILE* record);
+
+    CShellContent& m_kContent;
+    CShellWindow& m_kWindow;
+    std::vector<CReport> m_kReports;
+    size_t m_uiTaken = 0;
+};
+
+/// What the option --job asks for.
+EBatchJob BatchJobOf(const COptions& options);
+
+} // namespace gw

@@ -1,0 +1,93 @@
+#include "CConversionRun.h"
+
+#include "CContentHash.h"
+#include "CFilePlatform.h"
+#include "CPagePart.h"
+#include "CReport.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "PageOutput.h"
+
+#include <utility>
+
+namespace gw {
+
+namespace {
+
+std::string OutcomeWords(EConversion outcome)
+{
+    return outcome == EConversion::Converted ? "converted, and could not be measured" : OutcomeName(outcome);
+}
+
+} // namespace
+
+CFileRun::CFileEnd CConversionRun::Convert(const COptions& options, size_t index, std::FILE* record)
+{
+    CPagePart part(index + 1, AllJobs().size());
+    const EConversion outcome =
+        ConvertFile(options, AllJobs()[index], record, IsPageAsked(options) ? &part : nullptr);
+    m_kDrawn = part.ToText();
+    return {.outcome = outcome, .endsRun = outcome == EConversion::Failed && !options.keepGoing};
+}
+
+void CConversionRun::TellLost(size_t index, const CReport& reason, std::FILE* record)
+{
+    TellFailed(Options(), AllJobs()[index], reason, record);
+}
+
+void CConversionRun::TellUpToDate(size_t index)
+{
+    TellSkipped(Options(), AllJobs()[index], "the output is up to date");
+}
+
+// The one that is asked for, or all among which each source chooses.
+bool CConversionRun::AddProfiles(CContentHash& key)
+{
+    CShellWindow window(Options());
+    CFilePlatform platform(EPlatformWriting::No, Options().dataFolder);
+    CShellContent content(window, platform);
+    if (!Options().profile.empty())
+    {
+        const std::string path = content.ResolveProfile(Options().profile);
+        key.AddFile(path);
+        return !path.empty();
+    }
+    for (const CInstalledProfile& profile : content.InstalledProfiles())
+        key.AddText(profile.name).AddFile(profile.path);
+    return true;
+}
+
+// Nothing stays for the next conversion, which may be none.
+std::string CConversionRun::Enclosure()
+{
+    return std::exchange(m_kDrawn, {});
+}
+
+void CConversionRun::TakeRecord(size_t index, EConversion outcome, std::string_view,
+                                std::string_view enclosure)
+{
+    m_uiTaken = index + 1;
+    if (!IsPageAsked(Options()))
+        return;
+    CPagePart part(index + 1, AllJobs().size());
+    if (part.FromText(enclosure))
+        m_kPage.Add(AllJobs()[index].source, part);
+    else
+        m_kPage.AddWithoutFigures(AllJobs()[index].source, OutcomeWords(outcome));
+}
+
+bool CConversionRun::FinishPage()
+{
+    for (size_t left = m_uiTaken; left < AllJobs().size(); ++left)
+        m_kPage.AddWithoutFigures(AllJobs()[left].source, "left");
+    return !m_kPage.HasConversions() || WritePage(Options(), m_kPage);
+}
+
+bool CConversionRun::TellEnd()
+{
+    TellTally(Options(), Tally());
+    const bool isWritten = !IsPageAsked(Options()) || FinishPage();
+    return isWritten && Tally()[EConversion::Failed] == 0;
+}
+
+} // namespace gw

@@ -1,0 +1,32 @@
+#pragma once
+
+#include "CConversionPage.h"
+#include "CFileRun.h"
+
+namespace gw {
+
+/// Many conversions as `convert` makes them, each from nothing.
+class CConversionRun : public CFileRun
+{
+public:
+    using CFileRun::CFileRun;
+
+protected:
+    CFileEnd Convert(const COptions& options, size_t index, std::FILE* record) override;
+    void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
+    void TellUpToDate(size_t index) override;
+    bool AddProfiles(CContentHash& key) override;
+    std::string Enclosure() override;
+    void TakeRecord(size_t index, EConversion outcome, std::string_view record,
+                    std::string_view enclosure) override;
+    bool TellEnd() override;
+
+private:
+    bool FinishPage();
+
+    std::string m_kDrawn; ///< what the page shows of the last conversion, in a worker
+    CConversionPage m_kPage;
+    size_t m_uiTaken = 0;
+};
+
+} // namespace gw

@@ -1,0 +1,67 @@
+#include "RunSetup.h"
+
+#include "Output.h"
+#include "Paths.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <unordered_set>
+
+namespace gw {
+
+namespace {
+
+constexpr int64_t kWorkerLimit = 1024; // far above the cores of any machine, far below what a system lets run
+
+} // namespace
+
+bool IsRunPossible(const COptions& options)
+{
+    const char* words = nullptr;
+    if (options.jobs && (*options.jobs < 1 || *options.jobs > kWorkerLimit))
+        words = "--jobs takes a number from 1 to 1024";
+    else if (options.resume && options.skipExisting)
+        words = "--resume and --skip-existing exclude each other";
+    else if (options.dryRun && !options.report.empty())
+        words = "--dry-run writes nothing, and so no --report";
+    else if (options.nullSeparated && options.filesFrom.empty())
+        words = "--null says how the list of --files-from is divided, and there is none";
+    else if (options.resume && options.outputFolder.empty() && options.files.empty())
+        words = "--resume keeps what is done in the output folder; name one with --out-dir";
+    if (words)
+        SayError(words);
+    return !words;
+}
+
+bool AreOutputsApart(const CFileRun::Jobs& jobs)
+{
+    std::unordered_set<std::string_view> outputs;
+    for (const CConversionJob& job : jobs)
+    {
+        if (outputs.insert(job.output).second)
+            continue;
+        SayError(Printable(job.source) + ": another source becomes " + Printable(job.output) + " too");
+        return false;
+    }
+    return true;
+}
+
+bool MakeOutputFolder(const COptions& options)
+{
+    if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
+        return true;
+    SayError(Printable(options.outputFolder) + ": the folder cannot be made");
+    return false;
+}
+
+CRunState StateOf(const COptions& options)
+{
+    CRunState state;
+    if (!options.outputFolder.empty())
+        state.folder = WithSeparator(options.outputFolder);
+    else if (!options.files.empty())
+        state.folder = WithSeparator(options.files[0]);
+    return state;
+}
+
+} // namespace gw

@@ -1,0 +1,128 @@
+#include "SourceList.h"
+
+#include "CMappedFile.h"
+#include "Paths.h"
+#include "SourceTree.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+// What is in a path beside the way down, such as "..", has no place below an output folder.
+std::vector<std::string> Steps(const std::string& path)
+{
+    std::vector<std::string> steps;
+    std::string_view rest = path;
+    for (std::string_view step = NextToken(rest, "/"); !step.empty(); step = NextToken(rest, "/"))
+    {
+        if (step != "." && step != "..")
+            steps.emplace_back(step);
+    }
+    return steps;
+}
+
+std::string Joined(std::span<const std::string> steps)
+{
+    std::string path;
+    for (const std::string& step : steps)
+        path += (path.empty() ? "" : "/") + step;
+    return path;
+}
+
+std::string ReadStandardInput()
+{
+    std::string text;
+    char piece[65536];
+    while (const size_t count = std::fread(piece, 1, sizeof piece, stdin))
+        text.append(piece, count);
+    return text;
+}
+
+bool ReadList(const COptions& options, std::vector<std::string>& paths)
+{
+    CMappedFile file;
+    const bool isInput = options.filesFrom == "-";
+    if (!isInput && file.Open(options.filesFrom) != EFailure::None)
+    {
+        SayError(Printable(options.filesFrom) + ": the list cannot be read");
+        return false;
+    }
+    const std::string input = isInput ? ReadStandardInput() : std::string();
+    std::string_view rest = isInput ? std::string_view(input) : file.Text();
+    std::string_view line;
+    while (options.nullSeparated ? !(line = NextToken(rest, std::string_view("\0", 1))).empty()
+                                 : NextLine(rest, line))
+    {
+        if (!line.empty())
+            paths.emplace_back(line);
+    }
+    return true;
+}
+
+// A folder that could not be read stands for the sources in it: converting it fails and says so.
+void AddFolder(const std::string& folder, const std::string& below, const COptions& options,
+               std::span<const std::string_view> extensions, std::vector<CSource>& sources)
+{
+    const CSourceTree tree = WalkFolder(folder, extensions, options.outputFolder);
+    for (const std::string& file : tree.files)
+        sources.push_back({WithSeparator(folder) + file, below + file});
+    for (const std::string& unreadable : tree.unreadable)
+        sources.push_back({unreadable, below + Joined(Steps(unreadable.substr(folder.size()))) + "folder"});
+}
+
+void AddListed(const std::vector<std::string>& paths, const COptions& options,
+               std::span<const std::string_view> extensions, std::vector<CSource>& sources)
+{
+    std::vector<std::string> common;
+    for (size_t i = 0; i < paths.size(); ++i)
+    {
+        std::vector<std::string> folder = Steps(paths[i]);
+        if (!folder.empty())
+            folder.pop_back();
+        if (i == 0)
+            common = folder;
+        common.erase(std::ranges::mismatch(common, folder).in1, common.end());
+    }
+    for (const std::string& path : paths)
+    {
+        const std::vector<std::string> steps = Steps(path);
+        const std::string below = Joined(std::span(steps).subspan(std::min(common.size(), steps.size())));
+        if (FolderExists(path))
+            AddFolder(path, WithSeparator(below), options, extensions, sources);
+        else
+            sources.push_back({path, below});
+    }
+}
+
+} // namespace
+
+bool ListSources(const COptions& options, std::span<const std::string_view> extensions,
+                 std::vector<CSource>& sources)
+{
+    for (const std::string& file : options.files)
+    {
+        const CPathParts parts = SplitPath(file);
+        if (FolderExists(file))
+            AddFolder(file, {}, options, extensions, sources);
+        else
+            sources.push_back({file, parts.stem + parts.extension});
+    }
+    std::vector<std::string> listed;
+    if (!options.filesFrom.empty() && !ReadList(options, listed))
+        return false;
+    AddListed(listed, options, extensions, sources);
+    return true;
+}
+
+std::string OutputOf(const std::string& folder, const CSource& source, std::string_view extension)
+{
+    const CPathParts parts = SplitPath(folder.empty() ? source.path : source.below);
+    return WithSeparator(folder) + parts.folder + parts.stem + std::string(extension);
+}
+
+} // namespace gw
