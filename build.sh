@@ -7,6 +7,7 @@
 #   ./build.sh asan         the same tests under AddressSanitizer and UndefinedBehaviorSanitizer
 #   ./build.sh bench        runs the benchmarks: ratios within one run
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
+#   ./build.sh cluster-test runs the lines of docs/clusters.md with Slurm and GNU parallel on this machine
 #   ./build.sh lint         checks formatting and runs the linter
 set -euo pipefail
 cd "$(dirname "$0")"
@@ -18,6 +19,7 @@ packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libgl1-mesa-d
 packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libgl1-mesa-dri fonts-dejavu-core)
 packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon)
 packages_bench=(libbenchmark-dev libassimp-dev python3 time)
+packages_cluster=(slurm-wlm munge parallel)
 packages_lint=(clang-format clang-tidy)
 packages_fuzz=(clang libclang-rt-14-dev python3)
 
@@ -126,6 +128,12 @@ fuzz)
   build fuzz
   fuzz "${2:-60}"
   ;;
+cluster-test)
+  prepare
+  need "${packages_cluster[@]}"
+  build release
+  tests/cluster/cluster_test.sh build/release/bin
+  ;;
 lint)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
   git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
@@ -133,7 +141,7 @@ lint)
   git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
   ;;
 *)
-  sed -n '4,10s/^# *//p' "$0"
+  sed -n '4,12s/^# *//p' "$0"
   exit 2
   ;;
 esac
