@@ -209,7 +209,7 @@ class Lost(RunTest):
     def test_an_interrupted_run_ends_whole_and_goes_on_later(self):
         for number in (signal.SIGINT, signal.SIGTERM):
             with self.subTest(number):
-                run = self.start("--jobs", "2", "--keep-going", "--resume", "--report", "report.jsonl")
+                run = self.start("--jobs", "1", "--keep-going", "--resume", "--report", "report.jsonl")
                 worker = self.worker_at_slow(run)
                 run.send_signal(number)
                 time.sleep(0.1)
