@@ -3,6 +3,8 @@
 #include "CMarkup.h"
 #include "CPagePart.h"
 #include "CSafeFile.h"
+#include "ConversionDetail.h"
+#include "ConversionMeasures.h"
 #include "KeyFigures.h"
 #include "PageStyle.h"
 #include "Paths.h"

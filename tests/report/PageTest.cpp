@@ -1,9 +1,9 @@
 // What stands in a page, whatever the names and the numbers of a motion.
 
 #include "CConversionPage.h"
-#include "CPagePart.h"
 #include "CMadeFigure.h"
 #include "CMarkup.h"
+#include "CPagePart.h"
 #include "ConvertedMotion.h"
 #include "TempFolder.h"
 
