@@ -67,6 +67,10 @@ CReport LostReport(const CConversionJob& job, const CJobEnd& end, float limit)
         return ShellFailure(job.source, "time-limit",
                             "not done within " + std::to_string(static_cast<int64_t>(limit)) +
                                 " seconds, and given up; --time-limit allows more");
+    if (end.kind == CJobEnd::EKind::Ran)
+        return ShellFailure(job.source, "no-record",
+                            "what there is to say about it cannot be kept (is there a limit on the size of "
+                            "files?)");
     const std::string cause = WIFSIGNALED(end.status)
                                   ? std::string(strsignal(WTERMSIG(end.status)))
                                   : "exit code " + std::to_string(WEXITSTATUS(end.status));
@@ -246,7 +250,7 @@ bool CFileRun::Take(size_t index, const CJobEnd& end)
     m_kBar.Clear();
     Emit(end.words, stderr);
     Emit(end.output, stdout);
-    const bool lost = end.kind != CJobEnd::EKind::Ran;
+    const bool lost = end.kind != CJobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
     const std::string record = lost ? TakeLost(index, end) : end.record;
     std::fflush(stdout);
     const auto outcome = lost ? EConversion::Failed : static_cast<EConversion>(end.answer & kOutcomeBits);

@@ -1,7 +1,8 @@
-// Loaded before a program, this makes one call of one kind fail: the FAULT_NUMBERth that the program makes of
-// FAULT_OPERATION, from the start of its main function on. How many it made is written to FAULT_REPORT when
-// it ends. Calls that the system's library makes for itself are not met.
+// Loaded before a program, this makes one call of one kind fail: the FAULT_NUMBERth that the program and its
+// worker processes make of FAULT_OPERATION, from the start of its main function on. How many they made is
+// written to FAULT_REPORT when it ends. Calls that the system's library makes for itself are not met.
 
+#include <atomic>
 #include <cerrno>
 #include <cstdarg>
 #include <cstdint>
@@ -9,6 +10,7 @@
 #include <cstdlib>
 #include <cstring>
 #include <iterator>
+#include <new>
 
 #include <dlfcn.h>
 #include <fcntl.h>
@@ -41,13 +43,15 @@ enum class EOperation : int
 constexpr const char* kNames[] = {"none",  "open", "write", "rename",  "sync",
                                   "close", "map",  "mode",  "reserve", "allocate"};
 
+using Count = std::atomic<long>;
+
 EOperation g_eOperation = EOperation::None;
 long g_iNumber = 0;
-long g_iCalls = 0;
+Count* g_pkCalls = nullptr; // of the program and the processes that work for it
 
 bool IsDue(EOperation operation)
 {
-    return operation == g_eOperation && ++g_iCalls == g_iNumber;
+    return operation == g_eOperation && ++*g_pkCalls == g_iNumber;
 }
 
 int Refuse(int error)
@@ -65,6 +69,9 @@ F* Next(const char* name)
 
 void Begin()
 {
+    const long shared =
+        syscall(SYS_mmap, nullptr, sizeof(Count), PROT_READ | PROT_WRITE, MAP_SHARED | MAP_ANONYMOUS, -1, 0);
+    g_pkCalls = new (reinterpret_cast<void*>(shared)) Count(0);
     const char* const operation = std::getenv("FAULT_OPERATION");
     const char* const number = std::getenv("FAULT_NUMBER");
     g_iNumber = number ? std::atol(number) : 0;
@@ -84,7 +91,7 @@ void Report()
     if (file < 0)
         return;
     char text[24];
-    const int length = std::snprintf(text, sizeof text, "%ld", g_iCalls);
+    const int length = std::snprintf(text, sizeof text, "%ld", g_pkCalls->load());
     syscall(SYS_write, file, text, static_cast<size_t>(length));
     syscall(SYS_close, file);
 }
