@@ -30,7 +30,7 @@ def decoded(form, content):
     if form == "utf-16":
         return content.decode("utf-16le"), True
     values = struct.unpack(FORMS[form], content)
-    return " ".join("%g" % value for value in values), True
+    return " ".join("%g" % value if isinstance(value, float) else str(value) for value in values), True
 
 
 class PageTest(harness.CliTest):
