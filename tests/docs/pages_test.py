@@ -4,7 +4,8 @@ A page's parts and what is held against the program:
 - a block with file=NAME becomes that file;
 - a console block is run, and what it prints must be what stands there;
 - a table of bytes ("offset", "size", "form", "here") must tell the file of the last dump without a gap;
-- a table of faults ("in `FILE`", "becomes", ...) is tried row by row on a copy of the file.
+- a table of faults ("in `FILE`", "becomes", ...) is tried row by row on a copy of the file;
+- a picture that a command draws must be the one that the page shows.
 """
 import os
 import struct
@@ -14,9 +15,12 @@ from pathlib import Path
 
 import harness
 from page import Block, Table, code_of, content_of, matches, read_page
+from picture import Picture
 
 PAGES = [harness.ROOT / "README.md", harness.ROOT / "docs" / "bone-maps.md",
          *sorted((harness.ROOT / "docs" / "formats").glob("*.md"))]
+
+MOST_OTHER_BYTES = 0.005  # of a picture; the bones and axes of a figure are a fiftieth
 
 FORMS = {"u8": "<B", "u16": "<H", "u32": "<I", "i32": "<i", "f32": "<f", "vec3": "<3f", "quat": "<4f", "mat4": "<16f"}
 
@@ -43,6 +47,9 @@ class PageTest(harness.CliTest):
                     self.take_block(part)
                 else:
                     self.take_table(part)
+        for drawn in sorted((self.folder / "docs" / "images").glob("*.png")):
+            with self.subTest(drawn.name):
+                self.assert_same_picture(drawn, harness.ROOT / "docs" / "images" / drawn.name)
 
     def set_the_desk(self):
         """A folder as the reader has it: the program on the path, the examples and the data at hand."""
@@ -97,6 +104,15 @@ class PageTest(harness.CliTest):
             self.assertTrue(sound, (offset, "the length of a string"))
             self.assertEqual(told, code_of(here), offset)
         self.assertEqual(end, len(self.dump))
+
+    def assert_same_picture(self, drawn, kept):
+        """Another library of lines may set a few points elsewhere."""
+        if drawn.read_bytes() == kept.read_bytes():
+            return
+        ours, theirs = Picture(drawn.read_bytes()), Picture(kept.read_bytes())
+        self.assertEqual((ours.width, ours.height), (theirs.width, theirs.height))
+        pairs = zip(b"".join(ours.rows), b"".join(theirs.rows))
+        self.assertLess(sum(a != b for a, b in pairs), MOST_OTHER_BYTES * 3 * ours.width * ours.height)
 
     def try_fault(self, name, row):
         """A row of changes and answer. Texts are replaced once; at a byte of a dump stands hex, or "end"."""
