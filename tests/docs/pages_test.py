@@ -8,10 +8,10 @@ A page's parts and what is held against the program:
 - a picture that a command draws must be the one that the page shows.
 """
 import os
+import re
 import struct
 import subprocess
 import unittest
-from pathlib import Path
 
 import harness
 from page import Block, Table, code_of, content_of, matches, read_page
@@ -142,7 +142,7 @@ class PageTest(harness.CliTest):
 
 
 def add_test(path):
-    name = "test_" + Path(path).stem.replace("-", "_")
+    name = "test_" + re.sub(r"\W", "_", str(path.relative_to(harness.ROOT).with_suffix("")))
     setattr(PageTest, name, lambda self: self.work_through(path))
 
 
