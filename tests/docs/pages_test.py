@@ -127,7 +127,7 @@ class PageTest(harness.CliTest):
             content = content.replace(place.encode(), becomes.encode(), 1)
         (self.folder / "tried").mkdir(exist_ok=True)
         self.write("tried/" + name, content)
-        self.assert_answer(answer, row[0], harness.subprocess.run(
+        self.assert_answer(answer, row[0], subprocess.run(
             [harness.PROGRAM, "info", name], cwd=self.folder / "tried", env=self.environment, capture_output=True,
             timeout=harness.SECONDS, text=True))
 
