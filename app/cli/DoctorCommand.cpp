@@ -50,7 +50,11 @@ void PrintFaults(const std::string& path, const CFindings& findings)
 void Print(const COptions& options, const std::string& path, const CFileExam& exam)
 {
     PrintFaults(path, exam.Findings());
-    if (!exam.Facts() || options.quiet)
+    if (options.quiet)
+        return;
+    if (!exam.Facts() && !exam.Findings().HasFaults())
+        PrintLine(Printable(path) + ": whole; a container has no poses to examine");
+    if (!exam.Facts())
         return;
     const bool mixed = exam.Findings().Has(EFault::MixedChannels);
     PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()) + (mixed ? ", rotation orders: mixed" : ""));

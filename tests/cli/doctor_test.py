@@ -119,7 +119,7 @@ class Doctor(CliTest):
             ("b.htr", htr("2 1 0 0 0 0 90 1", "2 nan 0 0 0 0 90 1"), FAILED, "b.htr:25: bad-number: "),
             ("c.cha", CHA, DONE, "c.cha: 2 joints"),
             ("d.chb", chb()[:-1], FAILED, "d.chb: byte "),
-            ("e.orn", scene, DONE, ""),
+            ("e.orn", scene, DONE, "e.orn: whole; "),
             ("f.orn", scene[:-20], FAILED, "f.orn: byte "),
             ("g.orn", pointer, FAILED, "g.orn: byte 1: lfs-pointer: "),
             ("h.htr", pointer, FAILED, "h.htr:1: lfs-pointer: "),
