@@ -77,6 +77,7 @@ Optional Of(const ConversionMeasures& measures, const ConversionDetail&)
 
 struct Row
 {
+    std::string_view key;
     std::string_view label;
     std::string_view unit;
     int decimals;
@@ -87,16 +88,16 @@ struct Row
 };
 
 constexpr Row kRows[] = {
-    {"Direction error", "°",  1, EIdeal::Least,   3.0,  5.0,  DirectionError                      },
-    {"Foot turn",       "°",  1, EIdeal::Least,   3.0,  10.0, OfFeet<TurnOf>                      },
-    {"Sole tilt",       "°",  1, EIdeal::Least,   10.0, 20.0, OfFeet<TiltOf>                      },
-    {"Added slide",     " mm", 1, EIdeal::Least,   5.0,  15.0, OfFeet<SlideOf>                     },
-    {"Contacts F1",     "",    3, EIdeal::Largest, 0.95, 0.9,  Of<&ConversionMeasures::contactF1>  },
-    {"Floor",           " mm", 1, EIdeal::Zero,    10.0, 30.0, Of<&ConversionMeasures::floorHeight>},
-    {"Sinking",         " mm", 1, EIdeal::Least,   10.0, 30.0, SinkDepth                           },
-    {"Knee pops",       "",    0, EIdeal::Least,   0.0,  2.0,  KneePops                            },
-    {"Jitter ratio",    "",    2, EIdeal::Least,   1.1,  1.5,  Of<&ConversionMeasures::jitterRatio>},
-    {"Travel ratio",    "",    3, EIdeal::One,     0.01, 0.05, Of<&ConversionMeasures::travelRatio>},
+    {"directionError", "Direction error", "°",  1, EIdeal::Least,   3.0,  5.0,  DirectionError                      },
+    {"footTurn",       "Foot turn",       "°",  1, EIdeal::Least,   3.0,  10.0, OfFeet<TurnOf>                      },
+    {"soleTilt",       "Sole tilt",       "°",  1, EIdeal::Least,   10.0, 20.0, OfFeet<TiltOf>                      },
+    {"addedSlide",     "Added slide",     " mm", 1, EIdeal::Least,   5.0,  15.0, OfFeet<SlideOf>                     },
+    {"contactF1",      "Contacts F1",     "",    3, EIdeal::Largest, 0.95, 0.9,  Of<&ConversionMeasures::contactF1>  },
+    {"floor",          "Floor",           " mm", 1, EIdeal::Zero,    10.0, 30.0, Of<&ConversionMeasures::floorHeight>},
+    {"sinking",        "Sinking",         " mm", 1, EIdeal::Least,   10.0, 30.0, SinkDepth                           },
+    {"kneePops",       "Knee pops",       "",    0, EIdeal::Least,   0.0,  2.0,  KneePops                            },
+    {"jitterRatio",    "Jitter ratio",    "",    2, EIdeal::Least,   1.1,  1.5,  Of<&ConversionMeasures::jitterRatio>},
+    {"travelRatio",    "Travel ratio",    "",    3, EIdeal::One,     0.01, 0.05, Of<&ConversionMeasures::travelRatio>},
 };
 
 // How far a figure is from the ideal, so that less is better.
@@ -169,7 +170,7 @@ std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const Co
     for (const Row& row : kRows)
     {
         const Optional value = row.value(measures, detail);
-        figures.push_back({row.label, row.unit, row.decimals, value, VerdictOf(row, value), MarkOf(row)});
+        figures.push_back({row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value), MarkOf(row)});
     }
     return figures;
 }

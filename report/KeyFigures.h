@@ -25,6 +25,7 @@ enum class EVerdict : uint8_t
 /// One of the figures by which a conversion is judged at a glance.
 struct KeyFigure
 {
+    std::string_view key; ///< among the members of a record
     std::string_view label;
     std::string_view unit; ///< "°", " mm" or nothing
     int decimals = 0;

@@ -3,6 +3,7 @@
 #include "CJsonWriter.h"
 #include "CompareReport.h"
 #include "ConvertedMotion.h"
+#include "KeyFigures.h"
 #include "Text.h"
 #include "WorstFrames.h"
 
@@ -121,6 +122,17 @@ void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured)
     WriteParts(json, measured.detail.parts);
     WriteKneePops(json, measured.sums.feet);
     WriteWorst(json, FindWorstFrames(measured.sums, measured.detail, kWorstFrames));
+}
+
+void WriteKeyFigures(CJsonWriter& json, const MeasuredConversion& measured)
+{
+    json.Key("figures").BeginObject();
+    for (const KeyFigure& figure : KeyFiguresOf(measured.sums, measured.detail))
+    {
+        json.Key(figure.key);
+        figure.value ? json.Number(static_cast<float>(*figure.value)) : json.Null();
+    }
+    json.EndObject();
 }
 
 } // namespace gw

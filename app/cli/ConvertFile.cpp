@@ -60,7 +60,7 @@ public:
             return EConversion::Planned;
         if (!Convert() || !Save())
             return EConversion::Failed;
-        if (m_kOptions.check || m_pkPart)
+        if (IsMeasured())
             Check();
         return EConversion::Converted;
     }
@@ -71,6 +71,11 @@ private:
     bool MayConvert();
     bool Convert();
     bool Save() { return m_kContent.SaveResult() != 0 && !m_kWindow.HasFailed(); }
+    // A later run with --resume may have a report.
+    bool IsMeasured() const
+    {
+        return m_kOptions.check || m_pkPart || !m_kOptions.report.empty() || m_kOptions.resume;
+    }
     void Check();
     void KeepMisfit();
     bool RefuseEmpty();
@@ -131,7 +136,8 @@ void CConversion::Check()
     m_kAccount.check = MeasureMotion(motion, m_kAccount.profilePath);
     if (!m_kAccount.check)
         return;
-    m_kAccount.plainCheck = MeasurePlainRules(m_kOptions, m_kJob, m_kAccount.profilePath);
+    if (m_kOptions.check || m_pkPart)
+        m_kAccount.plainCheck = MeasurePlainRules(m_kOptions, m_kJob, m_kAccount.profilePath);
     motion.profile = m_kAccount.profile;
     motion.measured = &*m_kAccount.check;
     motion.plain = m_kAccount.plainCheck ? &*m_kAccount.plainCheck : nullptr;
@@ -219,6 +225,8 @@ void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& j
         WriteFit(json, *account.misfit);
         json.EndObject();
     }
+    if (account.check && file != stdout)
+        WriteKeyFigures(json, *account.check);
     if (options.check)
         WriteChecks(json, account);
     json.EndObject();

@@ -51,7 +51,7 @@ constexpr COptionRow kOptions[] = {
         "a file with a source on each line, - for standard input"),
     Row(kNull, "-0,--null", "", &COptions::nullSeparated, "the list has zero bytes between its names"),
     Row(kReport, "--report", "FILE", &COptions::report,
-        "write a line of JSON for every source, in their order"),
+        "write a line of JSON for every source, in order: time, frames, profile, figures, warnings"),
     Row(kShards, "--shards", "K", &COptions::shards, "how many parts, for as many machines or more"),
     Row(kShard, "--shard", "I", &COptions::shard, "which part, from 0 on"),
     Row(kDryRun, "--dry-run", "", &COptions::dryRun, "say what would be done, and write nothing"),

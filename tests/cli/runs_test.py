@@ -292,7 +292,21 @@ class Resumed(RunTest):
 
     def test_the_line_of_a_single_file_goes_to_a_report_too(self):
         self.succeed("convert", WALK, "-o", "walk.htr", "--report", "report.jsonl")
-        self.assertEqual([(line["output"], line["outcome"]) for line in self.report()], [("walk.htr", "converted")])
+        line, = self.report()
+        self.assertEqual((line["output"], line["outcome"]), ("walk.htr", "converted"))
+        checked = self.succeed("convert", WALK, "-o", "walk.htr", "--check", "--json", "--force")
+        self.assertEqual(line["figures"]["travelRatio"], json.loads(checked.out)["check"]["travelRatio"])
+        self.assertNotIn("figures", json.loads(checked.out))
+
+    def test_a_page_about_many_is_the_same_by_any_number_of_processes(self):
+        self.write("takes/a/t12.bvh", BROKEN)
+        pages = []
+        for jobs in (1, 3):
+            self.convert("--keep-going", "--force", "--jobs", jobs, "--html", "page.html")
+            pages.append(self.read("page.html").decode())
+        self.assertEqual(pages[0], pages[1])
+        self.assertEqual(pages[0].count("<section id=\"motion"), TAKES - 1)
+        self.assertIn(">failed<", pages[0])
 
 
 class Shown(RunTest):
