@@ -9,6 +9,7 @@
 #include "CRetargeter.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <span>
@@ -208,7 +209,8 @@ private:
 
     // SaveResult.cpp
     bool WritePackage(const std::string& path);
-    bool SaveMotion(const std::string& path, float rate);
+    bool WriteMotion(const std::string& path, float rate);
+    bool SaveMotion(float rate, const std::function<bool(float frameScale)>& save);
     int ProfileRate() const;
     static std::string WithExtension(const std::string& path, std::string_view extension);
 

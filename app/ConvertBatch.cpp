@@ -106,7 +106,7 @@ EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::
     }
     Retarget(timing, true); // Shift has no say here
     m_kWriteRecord.Clear();
-    const bool saved = SaveMotion(output, kBatchRate);
+    const bool saved = WriteMotion(output, kBatchRate);
     Report(path, m_kWriteRecord);
     return saved ? EBatchStep::Done : EBatchStep::Ended;
 }

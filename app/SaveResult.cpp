@@ -2,11 +2,10 @@
 
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
-#include "CPrivateFile.h"
+#include "CPackageFile.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "FailureWords.h"
-#include "Packaging.h"
 #include "Paths.h"
 #include "StringTable.h"
 
@@ -43,28 +42,36 @@ bool CGaitConvertContent::WriteResult(const std::string& path)
     m_kWriteRecord.Clear();
     const bool written = HasExtension(path, kPackageExtension)
                              ? WritePackage(path)
-                             : SaveMotion(WithExtension(path, kMotionExtension), kSavedRate);
+                             : WriteMotion(WithExtension(path, kMotionExtension), kSavedRate);
     Report(path, m_kWriteRecord);
     return written;
 }
 
-// The motion lies under a name of its own until it is packaged, so that an HTR beside the chosen name stays
-// as it is.
+// The motion's text goes straight into the package, so that an HTR beside the chosen name stays as it is.
 bool CGaitConvertContent::WritePackage(const std::string& path)
 {
-    const CPrivateFile motion(path, kMotionExtension);
-    if (motion.Path().empty())
-        return m_kWriteRecord.Fail(EFailure::WriteError);
-    return SaveMotion(motion.Path(), kSavedRate) &&
-           PackageMotion(motion.Path(), path, static_cast<float>(ProfileRate()), kHostRate, m_kWriteRecord);
+    const auto rate = static_cast<float>(ProfileRate());
+    CPackageFile package;
+    const auto append = [&](std::span<const std::byte> bytes) {
+        return package.Write(bytes) || m_kWriteRecord.Fail(package.Failure());
+    };
+    const auto write = [&](float frameScale) { return m_kResultMotion.SaveText(append, frameScale); };
+    if (!package.Open(path, {FormatCode(std::string(kMotionExtension)), rate, kHostRate}))
+        return m_kWriteRecord.Fail(package.Failure());
+    return SaveMotion(kSavedRate, write) && (package.Commit() || m_kWriteRecord.Fail(package.Failure()));
 }
 
-// Writes the result with as many times more frames as a rate stands above the profile's.
-bool CGaitConvertContent::SaveMotion(const std::string& path, float rate)
+bool CGaitConvertContent::WriteMotion(const std::string& path, float rate)
+{
+    return SaveMotion(rate, [&](float frameScale) { return m_kResultMotion.Save(path, frameScale); });
+}
+
+// Saves the result with as many times more frames as a rate stands above the profile's.
+bool CGaitConvertContent::SaveMotion(float rate, const std::function<bool(float frameScale)>& save)
 {
     if (ProfileRate() <= 0)
         return m_kWriteRecord.Fail(EFailure::BadNumber, 0, "FrameRate " + std::to_string(ProfileRate()));
-    const bool saved = m_kResultMotion.Save(path, rate / static_cast<float>(ProfileRate()));
+    const bool saved = save(rate / static_cast<float>(ProfileRate()));
     const CFailure& failure = m_kResultMotion.Record().Failure();
     return saved || m_kWriteRecord.Fail(failure.reason, failure.where, failure.name);
 }

@@ -95,6 +95,22 @@ bool CSafeFile::Write(std::span<const std::byte> bytes)
     return Write(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size()));
 }
 
+bool CSafeFile::Rewrite(uint64_t offset, std::span<const std::byte> bytes)
+{
+    while (m_iFile >= 0 && !m_bFailed && !bytes.empty())
+    {
+        const ssize_t written = pwrite(m_iFile, bytes.data(), bytes.size(), static_cast<off_t>(offset));
+        if (written >= 0)
+        {
+            bytes = bytes.subspan(static_cast<size_t>(written));
+            offset += static_cast<uint64_t>(written);
+        }
+        else if (errno != EINTR)
+            m_bFailed = true;
+    }
+    return m_iFile >= 0 && !m_bFailed;
+}
+
 bool CSafeFile::Commit()
 {
     const int file = std::exchange(m_iFile, -1);

@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstddef>
+#include <cstdint>
 #include <functional>
 #include <span>
 #include <string>
@@ -25,6 +26,8 @@ public:
     /// Writes all bytes; false when the file system does not take them, and Commit will then fail too.
     bool Write(std::string_view text);
     bool Write(std::span<const std::byte> bytes);
+    /// Replaces bytes that were written already, from an offset on; false as above.
+    bool Rewrite(uint64_t offset, std::span<const std::byte> bytes);
     /// Syncs and renames. False leaves the destination untouched. A private file is not synced: whoever made
     /// it reads it at once and removes it.
     bool Commit();

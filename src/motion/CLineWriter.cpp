@@ -16,10 +16,12 @@ constexpr std::string_view kLineEnd =
 
 } // namespace
 
-void CLineWriter::Flush()
+bool CLineWriter::Flush()
 {
-    m_kFile.Write(std::string_view(m_kBuffer.data(), m_uiUsed)); // a failure stays with the file until Commit
+    if (m_uiUsed > 0 && !m_bRefused)
+        m_bRefused = !m_kSink(std::as_bytes(std::span(m_kBuffer).first(m_uiUsed)));
     m_uiUsed = 0;
+    return !m_bRefused;
 }
 
 // Where that many bytes can be written.
@@ -68,12 +70,6 @@ void CLineWriter::EndLine()
 void CLineWriter::Line(std::string_view text)
 {
     Text(text).EndLine();
-}
-
-bool CLineWriter::Commit()
-{
-    Flush();
-    return m_kFile.Commit();
 }
 
 } // namespace gw

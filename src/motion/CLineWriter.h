@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CSafeFile.h"
+#include "CByteSink.h"
 #include "Numbers.h"
 
 #include <cstdint>
@@ -9,12 +9,12 @@
 
 namespace gw {
 
-/// Lines of text on their way into a file that is replaced in one step. The text goes out in pieces, so that
-/// it is never in memory as a whole.
+/// Lines of text on their way into a sink. The text goes out in pieces, so that it is never in memory as a
+/// whole.
 class CLineWriter
 {
 public:
-    bool Open(const std::string& path) { return m_kFile.Open(path); }
+    explicit CLineWriter(CByteSink sink) : m_kSink(std::move(sink)) {}
 
     // Parts of a line, in the order of the calls; EndLine ends it with the platform's line end.
     CLineWriter& Text(std::string_view text);
@@ -27,19 +27,18 @@ public:
     void EndLine();
     void Line(std::string_view text);
 
-    /// Writes what is left and puts the file in its place. False when anything failed on the way; the old
-    /// file stands.
-    bool Commit();
+    /// Hands on what is left. False when the sink refused anything since the start.
+    bool Flush();
 
 private:
     char* Room(size_t byteCount);
-    void Flush();
 
-    static constexpr size_t kPieceBytes = size_t{1} << 20;
+    static constexpr size_t kPieceBytes = size_t{1} << 16; // stays in the cache of a core
 
-    CSafeFile m_kFile;
+    CByteSink m_kSink;
     std::string m_kBuffer = std::string(kPieceBytes, '\0');
     size_t m_uiUsed = 0;
+    bool m_bRefused = false;
 };
 
 } // namespace gw

@@ -2,6 +2,7 @@
 
 #include "CKeyframeControl.h"
 #include "CLineWriter.h"
+#include "CSafeFile.h"
 #include "ERROBJ.h"
 #include "Paths.h"
 #include "RestPose.h"
@@ -111,8 +112,19 @@ bool CMotionFile::Save(const std::string& path, float frameScale)
     m_kRecord.Clear();
     if (!HasExtension(path, ".htr"))
         return m_kRecord.Fail(path.empty() ? EFailure::NotFound : EFailure::UnknownFormat);
+    return SaveBy([&](TKHTRStream& stream) { return stream.Save(path, frameScale); });
+}
+
+bool CMotionFile::SaveText(const CByteSink& sink, float frameScale)
+{
+    m_kRecord.Clear();
+    return SaveBy([&](TKHTRStream& stream) { return stream.SaveText(sink, frameScale); });
+}
+
+bool CMotionFile::SaveBy(const std::function<bool(TKHTRStream&)>& save)
+{
     TKHTRStream stream(*this);
-    const bool saved = AnswerOf(stream.m_kRecord, [&] { return stream.Save(path, frameScale); });
+    const bool saved = AnswerOf(stream.m_kRecord, [&] { return save(stream); });
     m_kRecord = stream.m_kRecord;
     return saved;
 }
@@ -143,12 +155,17 @@ bool CMotionFile::ReadLines(const std::string& path)
 
 bool CMotionFile::WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append)
 {
-    CLineWriter writer;
-    if (path.empty() || !writer.Open(path))
+    CSafeFile file;
+    if (path.empty() || !file.Open(path))
         return m_kRecord.Fail(EFailure::WriteError);
-    if (!append(writer))
-        return false;
-    return writer.Commit() || m_kRecord.Fail(EFailure::WriteError);
+    const CByteSink sink = [&](std::span<const std::byte> bytes) { return file.Write(bytes); };
+    return WriteLines(sink, append) && (file.Commit() || m_kRecord.Fail(EFailure::WriteError));
+}
+
+bool CMotionFile::WriteLines(const CByteSink& sink, const std::function<bool(CLineWriter&)>& append)
+{
+    CLineWriter writer(sink);
+    return append(writer) && (writer.Flush() || m_kRecord.Fail(EFailure::WriteError));
 }
 
 void SwitchControls(CNode& root, bool active)

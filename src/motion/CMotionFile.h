@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CByteSink.h"
 #include "CFailure.h"
 #include "CNode.h"
 #include "CTextLines.h"
@@ -10,6 +11,7 @@
 namespace gw {
 
 class CLineWriter;
+class TKHTRStream;
 
 /// The one door through which motions are loaded and saved, and the base class of the streams behind it. A
 /// loaded motion is a tree of nodes with one track and one bone mesh each; frame f is reached at time f /
@@ -30,6 +32,8 @@ public:
     /// Writes an HTR file with frameScale times as many frames; false for every other extension and for
     /// failures.
     virtual bool Save(const std::string& path, float frameScale);
+    /// Hands the text of that HTR file to a sink, in pieces.
+    virtual bool SaveText(const CByteSink& sink, float frameScale);
 
     /// The end time of the first control, in frames, or 0.
     float GetLastFrame() const;
@@ -50,9 +54,14 @@ protected:
     /// Replaces a file by the lines that `append` writes, in one step. False for an empty path, for a file
     /// that cannot be written, and where `append` gives up; the old file stands then.
     bool WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append);
+    /// Hands such lines to a sink. False where it refuses any or `append` gives up.
+    bool WriteLines(const CByteSink& sink, const std::function<bool(CLineWriter&)>& append);
 
     CTextLines lines; ///< the text being read
     CFailureRecord m_kRecord;
+
+private:
+    bool SaveBy(const std::function<bool(TKHTRStream&)>& save);
 };
 
 /// Switches every control under a node on or off. Switched off, a track gives its node the rest pose.

@@ -230,6 +230,17 @@ bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
 
 bool TKHTRStream::Save(const std::string& path, float frameScale)
 {
+    return SaveTo(path, frameScale);
+}
+
+bool TKHTRStream::SaveText(const CByteSink& sink, float frameScale)
+{
+    return SaveTo(sink, frameScale);
+}
+
+template <class T>
+bool TKHTRStream::SaveTo(const T& destination, float frameScale)
+{
     m_kRecord.Clear();
     if (!restRoot || !motionRoot)
         return m_kRecord.Fail(EFailure::NoRoot);
@@ -240,7 +251,7 @@ bool TKHTRStream::Save(const std::string& path, float frameScale)
     SwitchControls(*motionRoot, true);
 
     CRows rows(file, *motionRoot, FrameTimes(file.numFrames, GetFrequency(), frameScale));
-    const bool written = WriteLines(path, [&](CLineWriter& out) {
+    const bool written = WriteLines(destination, [&](CLineWriter& out) {
         if (!rows.Prepare())
             return m_kRecord.Fail(EFailure::TooLarge);
         WriteHeader(out, file);

@@ -25,6 +25,7 @@ public:
     /// rate. False where one is missing or the file cannot be written. Leaves the motion switched on, at time
     /// 0.
     bool Save(const std::string& path, float frameScale) override;
+    bool SaveText(const CByteSink& sink, float frameScale) override;
     /// Gives a node the bone mesh of its segment.
     virtual void AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node);
 
@@ -35,6 +36,8 @@ private:
     void FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment, CNode& node);
 
     bool FillHeader(TKHTRFile& file, float frameScale);
+    template <class T>
+    bool SaveTo(const T& destination, float frameScale);
 };
 
 } // namespace gw

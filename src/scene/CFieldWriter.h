@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CByteSink.h"
 #include "CFieldArchive.h"
 
 #include <functional>
@@ -7,9 +8,6 @@
 #include <string_view>
 
 namespace gw {
-
-/// Where written bytes go. The answer is false when they could not be taken.
-using CByteSink = std::function<bool(std::span<const std::byte>)>;
 
 /// Writes fields as a container holds them. Small values are gathered, large blocks go to the sink as they
 /// are.

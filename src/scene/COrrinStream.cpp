@@ -408,6 +408,11 @@ bool COrrinStream::SaveBuffer(std::vector<std::byte>& out)
     return writer.Flush();
 }
 
+std::span<const std::byte> COrrinStream::FileHeader()
+{
+    return std::as_bytes(std::span(kHeader));
+}
+
 bool COrrinStream::SaveFile(const std::string& path)
 {
     SetBaseDirectory(path);
@@ -421,7 +426,7 @@ bool COrrinStream::SaveFile(const std::string& path)
     }
     CFieldWriter writer([&](std::span<const std::byte> bytes) { return file.Write(bytes); },
                         [this](const CObject* object) { return LinkID(object); });
-    writer.WriteBytes(std::as_bytes(std::span(kHeader)));
+    writer.WriteBytes(FileHeader());
     WriteObjects(writer);
     if (!writer.Flush() || !file.Commit())
         return m_kRecord.Fail(EFailure::WriteError);

@@ -58,6 +58,8 @@ public:
     bool SaveFile(const std::string& path);
     /// The object part of a file, without the header. False when the scene is too large.
     bool SaveBuffer(std::vector<std::byte>& out);
+    /// What stands before the object part of a file in the newest version.
+    static std::span<const std::byte> FileHeader();
 
     /// False for null and for an object that is a root already.
     bool AddRoot(CObject* object);

@@ -2,46 +2,31 @@
 
 #include "CCustomData.h"
 #include "CMappedFile.h"
-#include "CNode.h"
 #include "COrrinStream.h"
+#include "CPackageFile.h"
 #include "Paths.h"
-#include "Text.h"
 
-#include <cstring>
+#include <algorithm>
 
 namespace gw {
 
 namespace {
 
-constexpr const char* kCreator = "It's me 3";
+constexpr size_t kPieceBytes = size_t{8} << 20;
 
-struct InfoBlock
+bool CopyMotion(CMappedFile& motion, CPackageFile& package)
 {
-    uint32_t m_uiVersion = 1;
-    uint32_t m_uiFormat;
-    float m_fThird;
-    float m_fFourth;
-};
-static_assert(sizeof(InfoBlock) == 16);
-
-uint32_t FormatCode(const std::string& path)
-{
-    constexpr struct
+    const std::span<const std::byte> bytes = motion.Bytes();
+    size_t done = 0;
+    while (done < bytes.size())
     {
-        std::string_view ending;
-        uint32_t code;
-    } kFormats[] = {
-        {".htr", 3},
-        {".cha", 1},
-        {".chb", 2}
-    };
-    const std::string lower = LowerCase(path);
-    for (const auto& format : kFormats)
-    {
-        if (lower.ends_with(format.ending))
-            return format.code;
+        const size_t count = std::min(bytes.size() - done, kPieceBytes);
+        if (!package.Write(bytes.subspan(done, count)))
+            return false;
+        done += count;
+        motion.Forget(done);
     }
-    return 0;
+    return true;
 }
 
 } // namespace
@@ -62,25 +47,13 @@ bool PackageMotion(const std::string& sourcePath, const std::string& targetPath,
     uint64_t byteCount = 0;
     if (FileSize(sourcePath, byteCount) && byteCount > kContainerBytesLimit)
         return record.Fail(EFailure::TooLarge, 0, sourcePath);
-    const Ref<CRawData> motion = LoadFileAsRawData(sourcePath);
-    if (!motion)
+    CMappedFile motion;
+    if (motion.Open(sourcePath) != EFailure::None)
         return record.Fail(EFailure::NotFound, 0, sourcePath);
-    motion->SetName("MotionFile");
-    motion->SetCreator(kCreator, 3, 0);
-
-    const Ref<CNode> node = new CNode(1);
-    const Ref<CRawData> info = new CRawData;
-    info->SetCreator(kCreator, 3, 0);
-    info->SetName("MotionInfo");
-    const InfoBlock block{.m_uiFormat = FormatCode(sourcePath), .m_fThird = third, .m_fFourth = fourth};
-    info->SetData(std::as_bytes(std::span(&block, 1)));
-    info->SetNextData(motion.Get());
-
-    COrrinStream stream;
-    stream.AddRoot(node.Get());
-    stream.AddRoot(info.Get());
-    if (!stream.SaveFile(targetPath))
-        record.Fail(stream.Record().Failure().reason, 0, targetPath);
+    CPackageFile package;
+    if (!package.Open(targetPath, {FormatCode(sourcePath), third, fourth}) || !CopyMotion(motion, package) ||
+        !package.Commit())
+        record.Fail(package.Failure(), 0, targetPath);
     return true;
 }
 

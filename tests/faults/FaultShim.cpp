@@ -151,6 +151,13 @@ ssize_t write(int file, const void* bytes, size_t count)
     return IsDue(EOperation::Write) ? Refuse(ENOSPC) : syscall(SYS_write, file, bytes, count);
 }
 
+ssize_t pwrite(int file, const void* bytes, size_t count, off_t offset)
+{
+    return IsDue(EOperation::Write) ? Refuse(ENOSPC) : syscall(SYS_pwrite64, file, bytes, count, offset);
+}
+
+ssize_t pwrite64(int file, const void* bytes, size_t count, off_t offset) __attribute__((alias("pwrite")));
+
 int rename(const char* from, const char* to)
 {
     return IsDue(EOperation::Rename) ? Refuse(EIO) : static_cast<int>(syscall(SYS_rename, from, to));

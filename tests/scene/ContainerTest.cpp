@@ -1,5 +1,6 @@
 #include "CCamera.h"
 #include "CLight.h"
+#include "CPackageFile.h"
 #include "Packaging.h"
 #include "Paths.h"
 #include "SceneBytes.h"
@@ -91,6 +92,45 @@ TEST(PackageMotion, EveryByteIsWhereItBelongs)
         EXPECT_EQ(bytes.Bytes().size(), 381 + content.size());
         EXPECT_EQ(ReadBytes(folder.Path("out")), bytes.View());
     }
+}
+
+TEST(CPackageFile, PiecesMakeThePackageOfTheWholeMotion)
+{
+    const CTempFolder folder;
+    const std::string motion(100'000, 'm'); // more than is gathered before it goes out
+    WriteBytes(folder.Path("a.htr"), motion);
+    CFailureRecord record;
+    ASSERT_TRUE(PackageMotion(folder.Path("a.htr"), folder.Path("whole"), 30.0f, 60.0f, record));
+    for (const size_t pieceBytes : {size_t{1} << 16, size_t{4099}, motion.size()})
+    {
+        SCOPED_TRACE(pieceBytes);
+        CPackageFile package;
+        ASSERT_TRUE(package.Open(folder.Path("pieces"), {3, 30.0f, 60.0f}));
+        for (size_t begin = 0; begin < motion.size(); begin += pieceBytes)
+            EXPECT_TRUE(
+                package.Write(std::as_bytes(std::span(std::string_view(motion).substr(begin, pieceBytes)))));
+        EXPECT_TRUE(package.Commit());
+        EXPECT_EQ(ReadBytes(folder.Path("pieces")), ReadBytes(folder.Path("whole")));
+    }
+}
+
+TEST(CPackageFile, WhatIsNotCommittedOrTooLargeLeavesTheOldFile)
+{
+    const CTempFolder folder;
+    WriteBytes(folder.Path("out"), "old");
+    const std::byte piece[] = {std::byte{'m'}};
+    {
+        CPackageFile package;
+        ASSERT_TRUE(package.Open(folder.Path("out"), {}));
+        EXPECT_TRUE(package.Write(piece));
+    }
+    CPackageFile package;
+    ASSERT_TRUE(package.Open(folder.Path("out"), {}));
+    EXPECT_FALSE(package.Write({piece, kContainerBytesLimit})) << "looked at before it is read";
+    EXPECT_EQ(package.Failure(), EFailure::TooLarge);
+    EXPECT_FALSE(package.Write(piece));
+    EXPECT_FALSE(package.Commit());
+    EXPECT_EQ(ReadBytes(folder.Path("out")), "old");
 }
 
 TEST(PackageMotion, ASourceThatIsNotThereIsRefusedAndATargetThatCannotBeIsTold)

@@ -1,0 +1,119 @@
+// The motion is the last thing in a package, so that all before it, the head, can be written before the
+// motion is known. Only its size stands in the head, and is written there when it has come.
+
+#include "CPackageFile.h"
+
+#include "CCustomData.h"
+#include "CNode.h"
+#include "COrrinStream.h"
+#include "Text.h"
+
+#include <cstring>
+#include <string_view>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kCreator = "It's me 3";
+
+struct InfoBlock
+{
+    uint32_t m_uiVersion = 1;
+    uint32_t m_uiFormat;
+    float m_fThird;
+    float m_fFourth;
+};
+static_assert(sizeof(InfoBlock) == 16);
+
+// The end of the head. A block without bytes is not there at all.
+struct MotionSize
+{
+    uint32_t m_uiByteCount;
+    uint32_t m_uiPresent;
+};
+static_assert(sizeof(MotionSize) == 8);
+
+Ref<CRawData> MakeBlock(const char* name, std::span<const std::byte> bytes)
+{
+    Ref<CRawData> block = new CRawData;
+    block->SetName(name);
+    block->SetCreator(kCreator, 3, 0);
+    block->SetData(bytes);
+    return block;
+}
+
+// A package whose motion has no bytes.
+std::vector<std::byte> EmptyPackage(const CPackageInfo& info)
+{
+    const InfoBlock block{.m_uiFormat = info.format, .m_fThird = info.third, .m_fFourth = info.fourth};
+    const Ref<CNode> node = new CNode(1);
+    const Ref<CRawData> facts = MakeBlock("MotionInfo", std::as_bytes(std::span(&block, 1)));
+    const Ref<CRawData> motion = MakeBlock("MotionFile", {});
+    facts->SetNextData(motion.Get());
+
+    COrrinStream stream;
+    stream.AddRoot(node.Get());
+    stream.AddRoot(facts.Get());
+    std::vector<std::byte> objects;
+    stream.SaveBuffer(objects);
+    const std::span<const std::byte> header = COrrinStream::FileHeader();
+    objects.insert(objects.begin(), header.begin(), header.end());
+    return objects;
+}
+
+} // namespace
+
+uint32_t FormatCode(const std::string& path)
+{
+    constexpr struct
+    {
+        std::string_view ending;
+        uint32_t code;
+    } kFormats[] = {
+        {".htr", 3},
+        {".cha", 1},
+        {".chb", 2}
+    };
+    const std::string lower = LowerCase(path);
+    for (const auto& format : kFormats)
+    {
+        if (lower.ends_with(format.ending))
+            return format.code;
+    }
+    return 0;
+}
+
+bool CPackageFile::Keep(bool written)
+{
+    if (!written && m_eFailure == EFailure::None)
+        m_eFailure = EFailure::WriteError;
+    return m_eFailure == EFailure::None;
+}
+
+bool CPackageFile::Open(const std::string& path, const CPackageInfo& info)
+{
+    m_eFailure = EFailure::None;
+    m_uiMotionBytes = 0;
+    const std::vector<std::byte> head = EmptyPackage(info);
+    m_uiHeadBytes = head.size();
+    return Keep(m_kFile.Open(path) && m_kFile.Write(head));
+}
+
+bool CPackageFile::Write(std::span<const std::byte> motion)
+{
+    m_uiMotionBytes += motion.size();
+    if (m_uiHeadBytes + m_uiMotionBytes > kContainerBytesLimit && m_eFailure == EFailure::None)
+        m_eFailure = EFailure::TooLarge;
+    return m_eFailure == EFailure::None && Keep(m_kFile.Write(motion));
+}
+
+bool CPackageFile::Commit()
+{
+    const MotionSize size{static_cast<uint32_t>(m_uiMotionBytes), m_uiMotionBytes > 0 ? 1u : 0u};
+    return m_eFailure == EFailure::None &&
+           Keep(m_kFile.Rewrite(m_uiHeadBytes - sizeof size, std::as_bytes(std::span(&size, 1))) &&
+                m_kFile.Commit());
+}
+
+} // namespace gw
