@@ -125,12 +125,12 @@ public:
     /// A notification of the profile list; code 9 is a choice by hand.
     void OnCntCommand(int code);
     void DeleteSelectedProfile();
-    void RefreshProfileList();
+    virtual void RefreshProfileList();
     void PruneProfileList();
-    void SelectProfileByName(const std::string& name);
+    virtual void SelectProfileByName(const std::string& name);
     /// Loads a profile that need not be in the list, as if it had been chosen there.
     void UseProfileFile(const std::string& path);
-    void PickStockProfile();
+    virtual void PickStockProfile();
 
     EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
     void ProfileStateChanged() override;
@@ -261,9 +261,7 @@ private:
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
-    std::string m_kProfilePath; ///< of the profile selected in the list; empty means none
-    std::string m_kPoserProfileName;
-    std::string m_kMaxProfileName;
+    std::string m_kProfilePath;               ///< of the profile selected in the list; empty means none
     std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                     ///< what SetTitle was given last
     ConversionChoices m_kChoices;

@@ -66,10 +66,6 @@ void CGaitConvertContent::AddProfiles(const std::string& folder, int userData)
     {
         const std::string name = ReadProfileName(folder + file);
         m_kWindow.ProfileCombo().AddItem(name, userData);
-        if (userData == kStock && EqualNoCase(file, kPoserFile))
-            m_kPoserProfileName = name;
-        else if (userData == kStock && EqualNoCase(file, kMaxFile))
-            m_kMaxProfileName = name;
         m_kProfileNames.push_back(name);
     }
 }
@@ -140,9 +136,10 @@ bool CGaitConvertContent::ProfileFits(const std::string& path)
 
 void CGaitConvertContent::PickStockProfile()
 {
+    const std::string poserName = ReadProfileName(ExeFile(kPoserFile));
     if (ProfileFits(ExeFile(kPoserFile)))
     {
-        SelectProfileByName(m_kPoserProfileName);
+        SelectProfileByName(poserName);
         return;
     }
     if (!ProfileFits(ExeFile(kMaxFile)))
@@ -150,8 +147,8 @@ void CGaitConvertContent::PickStockProfile()
     // A user's choice outlives an open, unless it is the other stock profile.
     const CCntComboExControl& list = m_kWindow.ProfileCombo();
     const std::string* const selected = list.GetItemText(list.GetCurSel());
-    if (!selected || EqualNoCase(*selected, m_kPoserProfileName))
-        SelectProfileByName(m_kMaxProfileName);
+    if (!selected || EqualNoCase(*selected, poserName))
+        SelectProfileByName(ReadProfileName(ExeFile(kMaxFile)));
 }
 
 // The profile path goes on naming the deleted file until the next selection.

@@ -13,26 +13,8 @@ namespace gw {
 
 namespace {
 
-EFailure MapFile(int file, const std::byte*& bytes, size_t& size)
-{
-    struct stat status;
-    if (fstat(file, &status) != 0)
-        return EFailure::NotFound;
-    if (!S_ISREG(status.st_mode))
-        return EFailure::NotRegular;
-    if (status.st_size == 0)
-        return EFailure::None; // nothing can be mapped of no bytes
-
-    const auto length = static_cast<size_t>(status.st_size);
-    void* const mapped = mmap(nullptr, length, PROT_READ, MAP_PRIVATE, file, 0);
-    if (mapped == MAP_FAILED)
-        return errno == ENOMEM ? EFailure::OutOfMemory : EFailure::ReadError;
-    // A hint only: files are read from front to back once.
-    madvise(mapped, length, MADV_SEQUENTIAL);
-    bytes = static_cast<const std::byte*>(mapped);
-    size = length;
-    return EFailure::None;
-}
+// Up to here reading takes less time than the pages and their faults.
+constexpr size_t kReadBytes = size_t{1} << 14;
 
 void* PageAddress(const std::byte* bytes)
 {
@@ -47,12 +29,14 @@ CMappedFile::~CMappedFile()
 }
 
 CMappedFile::CMappedFile(CMappedFile&& other) noexcept
-    : m_pkBytes(std::exchange(other.m_pkBytes, nullptr)), m_uiSize(std::exchange(other.m_uiSize, 0))
+    : m_spkSmall(std::move(other.m_spkSmall)), m_pkBytes(std::exchange(other.m_pkBytes, nullptr)),
+      m_uiSize(std::exchange(other.m_uiSize, 0))
 {
 }
 
 CMappedFile& CMappedFile::operator=(CMappedFile&& other) noexcept
 {
+    std::swap(m_spkSmall, other.m_spkSmall);
     std::swap(m_pkBytes, other.m_pkBytes);
     std::swap(m_uiSize, other.m_uiSize);
     return *this;
@@ -65,22 +49,65 @@ EFailure CMappedFile::Open(const std::string& path)
     const int file = open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (file < 0)
         return EFailure::NotFound;
-    const EFailure failure = MapFile(file, m_pkBytes, m_uiSize);
+    const EFailure failure = Take(file);
     close(file);
     return failure;
 }
 
+EFailure CMappedFile::Take(int file)
+{
+    struct stat status;
+    if (fstat(file, &status) != 0)
+        return EFailure::NotFound;
+    if (!S_ISREG(status.st_mode))
+        return EFailure::NotRegular;
+    const auto size = static_cast<size_t>(status.st_size);
+    return size <= kReadBytes ? Read(file, size) : Map(file, size);
+}
+
+EFailure CMappedFile::Read(int file, size_t size)
+{
+    auto bytes = std::make_unique_for_overwrite<std::byte[]>(size);
+    size_t done = 0;
+    while (done < size)
+    {
+        const ssize_t count = read(file, bytes.get() + done, size - done);
+        if (count < 0 && errno != EINTR)
+            return EFailure::ReadError;
+        if (count == 0)
+            break; // somebody has cut it meanwhile
+        done += static_cast<size_t>(std::max<ssize_t>(count, 0));
+    }
+    m_spkSmall = std::move(bytes);
+    m_pkBytes = m_spkSmall.get();
+    m_uiSize = done;
+    return EFailure::None;
+}
+
+EFailure CMappedFile::Map(int file, size_t size)
+{
+    void* const mapped = mmap(nullptr, size, PROT_READ, MAP_PRIVATE, file, 0);
+    if (mapped == MAP_FAILED)
+        return errno == ENOMEM ? EFailure::OutOfMemory : EFailure::ReadError;
+    // A hint only: files are read from front to back once.
+    madvise(mapped, size, MADV_SEQUENTIAL);
+    m_pkBytes = static_cast<const std::byte*>(mapped);
+    m_uiSize = size;
+    return EFailure::None;
+}
+
 void CMappedFile::Close()
 {
-    if (m_pkBytes)
+    if (m_pkBytes && !m_spkSmall)
         munmap(PageAddress(m_pkBytes), m_uiSize);
+    m_spkSmall.reset();
     m_pkBytes = nullptr;
     m_uiSize = 0;
 }
 
 void CMappedFile::Forget(size_t endOffset)
 {
-    if (!m_pkBytes)
+    if (!m_pkBytes || m_spkSmall)
         return;
     const auto pageSize = static_cast<size_t>(sysconf(_SC_PAGESIZE));
     const size_t length = std::min(endOffset, m_uiSize) / pageSize * pageSize;

@@ -3,14 +3,15 @@
 #include "CFailure.h"
 
 #include <cstddef>
+#include <memory>
 #include <span>
 #include <string>
 #include <string_view>
 
 namespace gw {
 
-/// The bytes of a regular file, mapped and not copied. Folders and devices are refused. An empty file maps to
-/// no bytes.
+/// The bytes of a regular file, mapped and not copied; a small one is read, which costs less. Folders and
+/// devices are refused. An empty file maps to no bytes.
 class CMappedFile
 {
 public:
@@ -31,6 +32,11 @@ public:
     void Forget(size_t endOffset);
 
 private:
+    EFailure Take(int file);
+    EFailure Read(int file, size_t size);
+    EFailure Map(int file, size_t size);
+
+    std::unique_ptr<std::byte[]> m_spkSmall; // where the bytes are not mapped
     const std::byte* m_pkBytes = nullptr;
     size_t m_uiSize = 0;
 };

@@ -104,7 +104,7 @@ EExit RunAlign(const COptions& options)
         return EExit::Failed;
     CShellWindow window(options);
     CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
+    CShellContent content(window, platform, PickFor(options));
     window.SetPaths(options.files[0], {});
     content.SetChoices({true, false});
     const bool written = Align(options, window, content);

@@ -1,7 +1,7 @@
 #include "CShellContent.h"
 
-#include "CCntComboExControl.h"
 #include "CContentWindow.h"
+#include "COptions.h"
 #include "CReport.h"
 #include "DoubtWords.h"
 #include "Paths.h"
@@ -12,7 +12,9 @@
 #include "Words.h"
 
 #include <algorithm>
+#include <initializer_list>
 #include <unordered_set>
+#include <utility>
 
 namespace gw {
 
@@ -39,29 +41,13 @@ CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfil
                             " ('gaitwright profiles' lists them)");
 }
 
-} // namespace
-
-CShellContent::CShellContent(CContentWindow& window, CPlatform& platform)
-    : CGaitConvertContent(window, platform), m_kWindow(window)
-{
-    OnInitContent(); // its answer tells of the views, which a shell does not have
-}
-
-std::string CShellContent::FindProfilePath(const std::string& name)
-{
-    if (!m_kFilePath.empty() && EqualNoCase(name, m_kFileName))
-        return m_kFilePath;
-    return CGaitConvertContent::FindProfilePath(name);
-}
-
 // Reads each folder once: asking for the path of every name would read all files for each.
-std::vector<CInstalledProfile> CShellContent::InstalledProfiles()
+std::vector<CInstalledProfile> ReadInstalled(std::initializer_list<std::pair<std::string, bool>> folders)
 {
     std::vector<CInstalledProfile> profiles;
     std::unordered_set<std::string> names;
-    for (const bool stock : {true, false})
+    for (const auto& [folder, stock] : folders)
     {
-        const std::string folder = stock ? ExeFile({}) : ProfileFile({});
         for (const std::string& file : FilesInFolder(folder, ".prf"))
         {
             std::string name = ReadProfileName(folder + file);
@@ -72,12 +58,59 @@ std::vector<CInstalledProfile> CShellContent::InstalledProfiles()
     return profiles;
 }
 
+} // namespace
+
+EStockPick PickFor(const COptions& options)
+{
+    return options.profile.empty() ? EStockPick::AtOpen : EStockPick::Never;
+}
+
+CShellContent::CShellContent(CContentWindow& window, CPlatform& platform, EStockPick pick)
+    : CGaitConvertContent(window, platform), m_kWindow(window), m_eStockPick(pick)
+{
+    OnInitContent(); // its answer tells of the views, which a shell does not have
+}
+
+std::string CShellContent::FindProfilePath(const std::string& name)
+{
+    if (!m_kFilePath.empty() && EqualNoCase(name, m_kFileName))
+        return m_kFilePath;
+    const std::vector<CInstalledProfile>& installed = InstalledProfiles();
+    const auto has = [&](const CInstalledProfile& profile) { return EqualNoCase(profile.name, name); };
+    const auto found = std::ranges::find_if(installed, has);
+    return found == installed.end() ? std::string() : found->path;
+}
+
+const std::vector<CInstalledProfile>& CShellContent::InstalledProfiles()
+{
+    if (!m_kInstalled)
+        m_kInstalled = ReadInstalled({
+            {ExeFile({}),     true },
+            {ProfileFile({}), false}
+        });
+    return *m_kInstalled;
+}
+
+void CShellContent::SelectProfileByName(const std::string& name)
+{
+    const std::string path = FindProfilePath(name);
+    if (!path.empty())
+        UseProfileFile(path);
+}
+
+void CShellContent::PickStockProfile()
+{
+    if (m_eStockPick == EStockPick::AtOpen)
+        CGaitConvertContent::PickStockProfile();
+}
+
 std::string CShellContent::ResolveProfile(const std::string& nameOrFile)
 {
-    std::string installed = FindProfilePath(nameOrFile);
+    std::string text;
+    const bool isFile = HasExtension(nameOrFile, ".prf") && ReadProfileText(nameOrFile, text);
+    std::string installed = isFile ? nameOrFile : FindProfilePath(nameOrFile);
     if (!installed.empty())
         return installed;
-    std::string text;
     if (ReadProfileText(nameOrFile, text))
         return nameOrFile;
     if (HasExtension(nameOrFile, ".prf") || FileExists(nameOrFile))
@@ -89,17 +122,11 @@ std::string CShellContent::ResolveProfile(const std::string& nameOrFile)
 
 bool CShellContent::SelectProfile(const std::string& nameOrFile)
 {
-    const std::string path = ResolveProfile(nameOrFile);
-    if (path.empty())
+    m_kFilePath = ResolveProfile(nameOrFile);
+    if (m_kFilePath.empty())
         return false;
-    const std::string name = ReadProfileName(path);
-    if (FindProfilePath(name) != path)
-    {
-        m_kFileName = name;
-        m_kFilePath = path;
-        m_kWindow.ProfileCombo().AddItem(name, 0);
-    }
-    SelectProfileByName(name);
+    m_kFileName = ReadProfileName(m_kFilePath);
+    UseProfileFile(m_kFilePath);
     return true;
 }
 

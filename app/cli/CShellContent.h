@@ -4,6 +4,7 @@
 #include "CPrivateProfile.h"
 #include "ChooseProfile.h"
 
+#include <cstdint>
 #include <optional>
 #include <span>
 #include <string>
@@ -11,6 +12,7 @@
 
 namespace gw {
 
+struct COptions;
 struct CProfileFit;
 
 /// An installed profile.
@@ -21,17 +23,28 @@ struct CInstalledProfile
     bool stock = false; ///< beside the program, and not one of the user's own
 };
 
-/// The conversion as the shell drives it: what a user does by hand in the list of profiles.
+/// Whether opening a source selects a stock profile that fits it.
+enum class EStockPick : uint8_t
+{
+    AtOpen,
+    Never, ///< a profile will be named
+};
+
+/// Never where --profile names one.
+EStockPick PickFor(const COptions& options);
+
+/// The conversion as the shell drives it: what a user does by hand in the list of profiles. Nobody sees that
+/// list here: which profiles are installed is looked up when it is first asked for, and stands from then on.
 class CShellContent : public CGaitConvertContent
 {
 public:
     /// Both ports must outlive the content.
-    CShellContent(CContentWindow& window, CPlatform& platform);
+    CShellContent(CContentWindow& window, CPlatform& platform, EStockPick pick = EStockPick::AtOpen);
 
-    /// The profiles of the list, each name once and with the file that it stands for.
-    std::vector<CInstalledProfile> InstalledProfiles();
-    /// The file of a profile that is named by its display name or by its path. Empty, and says why, for none
-    /// that can be read.
+    /// The installed profiles, each name once and with the file that it stands for.
+    const std::vector<CInstalledProfile>& InstalledProfiles();
+    /// The file of a profile that is named by its path, which ends in .prf, or by its display name, or by any
+    /// other path. Empty, and says why, for none that can be read.
     std::string ResolveProfile(const std::string& nameOrFile);
     /// Selects such a profile. Says why it cannot.
     bool SelectProfile(const std::string& nameOrFile);
@@ -51,6 +64,9 @@ public:
 
     /// A profile that was named by its file goes before an installed one of the same name.
     std::string FindProfilePath(const std::string& name) override;
+    void RefreshProfileList() override {}
+    void SelectProfileByName(const std::string& name) override;
+    void PickStockProfile() override;
 
 private:
     std::vector<ProfileChoice> HoldAgainstSource(std::span<const std::string> paths) const;
@@ -59,6 +75,8 @@ private:
     bool SelectAdapted(const ProfileChoice& choice);
 
     CContentWindow& m_kWindow;
+    EStockPick m_eStockPick;
+    std::optional<std::vector<CInstalledProfile>> m_kInstalled; ///< once asked for
     std::string m_kFileName; ///< display name of the profile in m_kFilePath
     std::string m_kFilePath; ///< of the profile that was named by its file, or empty
     CPrivateProfile m_kAdapted;

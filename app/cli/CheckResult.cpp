@@ -79,7 +79,7 @@ std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, con
     CSilentWindow window(options);
     CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
     window.SetPaths(job.source, job.output);
-    CShellContent content(window, platform);
+    CShellContent content(window, platform, EStockPick::Never);
     if (content.OpenSource() == 0 || !content.SelectProfile(profilePath) || content.ConvertMotion() == 0)
         return std::nullopt;
     return MeasureMotion(MotionOf(content, job), profilePath);

@@ -40,7 +40,7 @@ class CComparedSource
 public:
     explicit CComparedSource(const COptions& options)
         : m_kOptions(options), m_kWindow(options), m_kPlatform(EPlatformWriting::No, options.dataFolder),
-          m_kContent(m_kWindow, m_kPlatform)
+          m_kContent(m_kWindow, m_kPlatform, EStockPick::Never)
     {
     }
 

@@ -46,7 +46,8 @@ public:
     CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
                 CPagePart* part)
         : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account), m_pkPart(part),
-          m_kPlatform(EPlatformWriting::No, options.dataFolder), m_kContent(window, m_kPlatform)
+          m_kPlatform(EPlatformWriting::No, options.dataFolder),
+          m_kContent(window, m_kPlatform, PickFor(options))
     {
         window.SetPaths(job.source, job.output);
         m_kContent.SetChoices({options.align, options.faithful});

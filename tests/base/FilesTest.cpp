@@ -193,23 +193,27 @@ TEST(CMappedFile, MapsRegularFilesOnly)
 
 TEST(CMappedFile, KeepsItsBytesWhenMovedAndAfterForgetting)
 {
-    const CTempFolder folder;
-    std::string text(100000, 'x');
-    std::iota(text.begin(), text.end(), '\0');
-    WriteBytes(folder.Path("a"), text);
-    CMappedFile first;
-    ASSERT_EQ(first.Open(folder.Path("a")), EFailure::None);
-    CMappedFile second(std::move(first));
-    CMappedFile third;
-    third = std::move(second);
-    for (const size_t offset : {size_t{0}, size_t{5000}, text.size(), text.size() + 1, SIZE_MAX})
+    for (const size_t size : {size_t{5000}, size_t{16384}, size_t{16385}, size_t{100000}})
     {
-        third.Forget(offset);
-        EXPECT_EQ(third.Text(), text) << offset;
+        SCOPED_TRACE(size);
+        const CTempFolder folder;
+        std::string text(size, 'x');
+        std::iota(text.begin(), text.end(), '\0');
+        WriteBytes(folder.Path("a"), text);
+        CMappedFile first;
+        ASSERT_EQ(first.Open(folder.Path("a")), EFailure::None);
+        CMappedFile second(std::move(first));
+        CMappedFile third;
+        third = std::move(second);
+        for (const size_t offset : {size_t{0}, size_t{4500}, text.size(), text.size() + 1, SIZE_MAX})
+        {
+            third.Forget(offset);
+            EXPECT_EQ(third.Text(), text) << offset;
+        }
+        third.Close();
+        third.Forget(100);
+        EXPECT_TRUE(third.Text().empty());
     }
-    third.Close();
-    third.Forget(100);
-    EXPECT_TRUE(third.Text().empty());
 }
 
 TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)

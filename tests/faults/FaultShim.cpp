@@ -29,6 +29,7 @@ enum class EOperation : int
 {
     None,
     Open,
+    Read,
     Write,
     Rename,
     Sync,
@@ -40,8 +41,8 @@ enum class EOperation : int
 };
 
 // By EOperation.
-constexpr const char* kNames[] = {"none",  "open", "write", "rename",  "sync",
-                                  "close", "map",  "mode",  "reserve", "allocate"};
+constexpr const char* kNames[] = {"none",  "open", "read", "write",   "rename",  "sync",
+                                  "close", "map",  "mode", "reserve", "allocate"};
 
 using Count = std::atomic<long>;
 
@@ -145,6 +146,11 @@ std::FILE* fopen(const char* path, const char* mode)
 }
 
 std::FILE* fopen64(const char* path, const char* mode) __attribute__((alias("fopen")));
+
+ssize_t read(int file, void* bytes, size_t count)
+{
+    return IsDue(EOperation::Read) ? Refuse(EIO) : syscall(SYS_read, file, bytes, count);
+}
 
 ssize_t write(int file, const void* bytes, size_t count)
 {

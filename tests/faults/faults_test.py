@@ -26,7 +26,7 @@ if Path("/dev/shm").is_dir():
 SHIM = os.environ["GAITWRIGHT_FAULT_SHIM"]
 SAVE = os.environ["GAITWRIGHT_SAVE_PROGRAM"]
 SANITIZED = os.environ["GAITWRIGHT_SANITIZED"] == "1"
-OPERATIONS = ["open", "write", "rename", "sync", "close", "map", "mode", "reserve"]
+OPERATIONS = ["open", "read", "write", "rename", "sync", "close", "map", "mode", "reserve"]
 SAMPLES = int(os.environ.get("FAULT_SAMPLES", 40))  # of the allocations of one run
 OLD = b"what was there\n"
 DATA = Path(tempfile.mkdtemp(prefix="gaitwright-data-"))  # with a few profiles in place of all
