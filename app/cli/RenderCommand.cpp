@@ -142,7 +142,11 @@ EExit Tell(const COptions& options, const PictureOptions* picture)
 bool Draw(const PictureOptions& options, const std::string& output)
 {
     RgbPicture picture;
-    if (RenderPicture(options, picture) != EPictureAnswer::Done)
+    const EPictureAnswer answer = RenderPicture(options, picture);
+    if (answer == EPictureAnswer::NoPainter)
+        return Refuse(
+            "pictures need gw_picture_painter.so beside the program, and the libraries that it loads");
+    if (answer != EPictureAnswer::Done)
         return Refuse("the GL of this machine draws no such picture without a display; that of Mesa does");
     if (WritePng(output, picture))
         return true;

@@ -1,6 +1,6 @@
 #include "GLPainter.h"
 
-#include "CGLView.h"
+#include "GLScene.h"
 
 #include <GL/gl.h>
 #include <GL/glu.h>
@@ -12,11 +12,11 @@ namespace {
 constexpr double kNearPlane = 1.0;
 constexpr double kFarPlane = 10'000.0;
 
-void LookThrough(const CCamera& camera)
+void LookThrough(const GLScene& scene)
 {
-    const Vec3& eye = camera.m_kEye;
-    const Vec3& at = camera.m_kLookAt;
-    const Vec3& up = camera.m_kUp;
+    const Vec3& eye = scene.eye;
+    const Vec3& at = scene.lookAt;
+    const Vec3& up = scene.up;
     gluLookAt(eye.x, eye.y, eye.z, at.x, at.y, at.z, up.x, up.y, up.z);
 }
 
@@ -54,14 +54,14 @@ void ResizeGL(int width, int height)
     glLoadIdentity();
 }
 
-void PaintGL(CGLView& view)
+void PaintGL(const GLScene& scene)
 {
     glClear(GL_COLOR_BUFFER_BIT);
     glLoadIdentity();
-    glTranslatef(view.m_kPan.x, view.m_kPan.y, view.m_kPan.z);
+    glTranslatef(scene.pan.x, scene.pan.y, scene.pan.z);
     glPushMatrix();
-    LookThrough(view.m_kCamera);
-    DrawLines(view.DrawScene().Ends());
+    LookThrough(scene);
+    DrawLines(scene.ends);
     glPopMatrix();
     glFinish();
 }

@@ -2,7 +2,7 @@
 
 namespace gw {
 
-class CGLView;
+struct GLScene;
 
 /// What a view asks of its surface, in bits, beside two colour buffers: no alpha, stencil, accumulation or
 /// samples.
@@ -15,15 +15,13 @@ struct PixelFormat
 };
 inline constexpr PixelFormat kPixelFormat;
 
-inline constexpr double kAngleOfView = 45.0; ///< degrees, from the lower side of a view to the upper one
-
 // Each call wants a current context: version 2.1 or a compatibility profile, with no buffer object bound.
 
 /// Once for each context: flat shading and the clear colour.
 void InitGL();
 /// Viewport and projection for a surface of that many pixels. Below 1 both stay as they were.
 void ResizeGL(int width, int height);
-/// Clears and draws the view's scene, and waits until that is done. Swapping buffers is the window's.
-void PaintGL(CGLView& view);
+/// Clears and draws a scene, and waits until that is done. Swapping buffers is the window's.
+void PaintGL(const GLScene& scene);
 
 } // namespace gw

@@ -35,12 +35,12 @@ class CliTest(unittest.TestCase):
             if name.endswith("SAN_OPTIONS"):
                 self.environment[name] = value
 
-    def run_program(self, *arguments, file_limit=None, stdout=subprocess.PIPE):
+    def run_program(self, *arguments, program=PROGRAM, file_limit=None, stdout=subprocess.PIPE):
         """Runs in the test's folder. A file limit in bytes stands for a full disk."""
         def limit():
             resource.setrlimit(resource.RLIMIT_FSIZE, (file_limit, file_limit))
 
-        done = subprocess.run([PROGRAM, *map(str, arguments)], cwd=self.folder, env=self.environment,
+        done = subprocess.run([program, *map(str, arguments)], cwd=self.folder, env=self.environment,
                               stdin=subprocess.DEVNULL, stdout=stdout, stderr=subprocess.PIPE, timeout=SECONDS,
                               preexec_fn=limit if file_limit is not None else None)
         if done.stdout is None:

@@ -1,7 +1,8 @@
 """Pictures of motions, drawn without a display: what is in them, and what is no picture."""
 import json
+import shutil
 
-from harness import DONE, FAILED, USAGE, WALK, CliTest, main
+from harness import DONE, FAILED, PROGRAM, USAGE, WALK, CliTest, main
 from made import BVH, Container, moved
 from picture import Picture
 
@@ -100,6 +101,15 @@ class Refusals(CliTest):
                     self.assert_words(result, words)
                 self.assertEqual(self.files(), before)
         self.assertEqual(self.read("old.png"), b"old")
+
+    def test_a_program_without_the_module_that_draws_says_so_and_does_all_else(self):
+        alone = shutil.copy(PROGRAM, self.folder / "alone")
+        for arguments, code, words in ((["render", WALK, "-o", "out.png"], FAILED, ["gw_picture_painter.so"]),
+                                       (["info", WALK], DONE, [])):
+            result = self.run_program(*arguments, program=alone)
+            self.assertEqual(result.code, code, result.err)
+            self.assert_words(result, words)
+        self.assertEqual(self.files(), ["alone"])
 
     def test_a_picture_that_is_there_is_passed_over_when_asked(self):
         self.write("out.png", "old")

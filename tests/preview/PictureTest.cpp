@@ -2,6 +2,7 @@
 
 #include "COffscreenContext.h"
 #include "GLPainter.h"
+#include "GLScene.h"
 #include "Pixels.h"
 #include "PreviewScene.h"
 
@@ -28,7 +29,7 @@ protected:
 
     RgbPicture Draw(CGLView& view)
     {
-        PaintGL(view);
+        PaintGL(SceneOf(view));
         return m_kContext.ReadPixels(kSide, kSide);
     }
     RgbPicture Draw(CNode* scene, const char* highlight = "")

@@ -2,6 +2,7 @@
 
 #include "CLeftKeys.h"
 #include "GLPainter.h"
+#include "GLScene.h"
 
 #include <QGuiApplication>
 #include <QMouseEvent>
@@ -58,7 +59,7 @@ void CPreviewWidget::resizeGL(int width, int height)
 void CPreviewWidget::paintGL()
 {
     CGLView empty;
-    PaintGL(m_pkView ? *m_pkView : empty);
+    PaintGL(SceneOf(m_pkView ? *m_pkView : empty));
 }
 
 void CPreviewWidget::mousePressEvent(QMouseEvent* event)

@@ -2,8 +2,9 @@
 
 #include "Angles.h"
 #include "CGLView.h"
-#include "COffscreenContext.h"
-#include "GLPainter.h"
+#include "CPicturePainter.h"
+#include "GLScene.h"
+#include "PicturePainter.h"
 
 #include <algorithm>
 #include <cmath>
@@ -120,14 +121,13 @@ public:
         }
     }
 
-    void Draw(const Moment& moment, const Cell& cell)
+    RgbPicture Draw(CPicturePainter& painter, const Moment& moment, const Cell& cell)
     {
         GoTo(moment);
         CCamera& camera = m_kView.m_kCamera;
         camera.m_kLookAt = ExtentOf(m_kView.DrawScene().Ends()).centre;
         camera.m_kEye = camera.m_kLookAt + Vec3{0.0f, 0.0f, EyeDistance(cell)};
-        ResizeGL(cell.width, cell.height);
-        PaintGL(m_kView);
+        return painter.Paint(SceneOf(m_kView), cell.width, cell.height);
     }
 
 private:
@@ -151,6 +151,24 @@ private:
     Vec3 m_kHalf = kVec3Zero;
 };
 
+void DrawAll(const PictureOptions& options, CPicturePainter& painter, RgbPicture& picture)
+{
+    picture = RgbPicture(options.width, options.height);
+    const Grid grid = GridOf(options);
+    const std::vector<Moment> moments = MomentsOf(options);
+    const bool strip = moments.size() > 1;
+    for (int motion = 0; motion < static_cast<int>(options.motions.size()); ++motion)
+    {
+        CPoseDrawer drawer(options.motions[static_cast<size_t>(motion)], options.highlight);
+        drawer.Measure(moments);
+        for (int pose = 0; pose < options.poseCount; ++pose)
+        {
+            const Cell cell = strip ? grid.At(pose, motion) : grid.At(motion, 0);
+            Paste(drawer.Draw(painter, moments[static_cast<size_t>(pose)], cell), cell, picture);
+        }
+    }
+}
+
 } // namespace
 
 int FirstFrame(const PictureOptions& options)
@@ -172,26 +190,14 @@ EPictureAnswer RenderPicture(const PictureOptions& options, RgbPicture& picture)
 {
     if (!IsDrawable(options))
         return EPictureAnswer::BadSize;
-    COffscreenContext context;
-    if (!context.Create(options.width, options.height))
-        return EPictureAnswer::NoContext;
-    InitGL();
-    picture = RgbPicture(options.width, options.height);
-    const Grid grid = GridOf(options);
-    const std::vector<Moment> moments = MomentsOf(options);
-    const bool strip = moments.size() > 1;
-    for (int motion = 0; motion < static_cast<int>(options.motions.size()); ++motion)
-    {
-        CPoseDrawer drawer(options.motions[static_cast<size_t>(motion)], options.highlight);
-        drawer.Measure(moments);
-        for (int pose = 0; pose < options.poseCount; ++pose)
-        {
-            const Cell cell = strip ? grid.At(pose, motion) : grid.At(motion, 0);
-            drawer.Draw(moments[static_cast<size_t>(pose)], cell);
-            Paste(context.ReadPixels(cell.width, cell.height), cell, picture);
-        }
-    }
-    return EPictureAnswer::Done;
+    CPicturePainter* const painter = LoadPicturePainter();
+    if (!painter)
+        return EPictureAnswer::NoPainter;
+    const bool begun = painter->Begin(options.width, options.height);
+    if (begun)
+        DrawAll(options, *painter, picture);
+    painter->End();
+    return begun ? EPictureAnswer::Done : EPictureAnswer::NoContext;
 }
 
 } // namespace gw

@@ -35,6 +35,7 @@ enum class EPictureAnswer : uint8_t
     Done,
     BadSize,   ///< no motion or no pose, more than there are pixels, or a side below 1 or above kLongestSide
     NoContext, ///< the machine's GL draws nothing without a display
+    NoPainter, ///< the module that draws, or a library that it needs, is not there
 };
 
 inline constexpr int kLongestSide = 8192; ///< 200 MB of pixels; software renderers take no more
