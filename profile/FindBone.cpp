@@ -29,7 +29,6 @@ CBoneNames::CBoneNames(CNode* root)
         CNode* node = static_cast<CNode*>(object);
         if (m_kExact.try_emplace(std::string(name), node).second)
             m_kNames.emplace_back(name);
-        m_kLowerCase.try_emplace(LowerCase(name), node); // the first of equal names stays
     }
 }
 
@@ -38,13 +37,32 @@ CNode* CBoneNames::Find(std::string_view name) const
     const auto exact = m_kExact.find(std::string(name));
     if (exact != m_kExact.end())
         return exact->second;
-    const auto lower = m_kLowerCase.find(LowerCase(name));
+    const auto lower = LowerCaseNames().find(LowerCase(name));
     return lower == m_kLowerCase.end() ? nullptr : lower->second;
+}
+
+// Most names are met as they are, so that this table waits for one that is not.
+const CBoneNames::NodeOfName& CBoneNames::LowerCaseNames() const
+{
+    if (m_kLowerCase.empty())
+    {
+        for (const std::string& name : m_kNames)
+            m_kLowerCase.try_emplace(LowerCase(name), m_kExact.at(name)); // the first of equal names stays
+    }
+    return m_kLowerCase;
 }
 
 CNode* FindBone(CNode* root, std::string_view name)
 {
-    return CBoneNames(root).Find(name);
+    const std::vector<CObject*> nodes = NodesBelow(root);
+    const auto has = [&](const CObject* node) { return node->GetName() && node->NameView() == name; };
+    const auto hasAnyCase = [&](const CObject* node) {
+        return node->GetName() && EqualNoCase(node->NameView(), name);
+    };
+    auto found = std::ranges::find_if(nodes, has);
+    if (found == nodes.end())
+        found = std::ranges::find_if(nodes, hasAnyCase);
+    return found == nodes.end() ? nullptr : static_cast<CNode*>(*found);
 }
 
 } // namespace gw

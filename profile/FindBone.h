@@ -24,8 +24,12 @@ public:
     const std::vector<std::string>& Names() const { return m_kNames; }
 
 private:
-    std::unordered_map<std::string, CNode*> m_kExact;
-    std::unordered_map<std::string, CNode*> m_kLowerCase;
+    using NodeOfName = std::unordered_map<std::string, CNode*>;
+
+    const NodeOfName& LowerCaseNames() const;
+
+    NodeOfName m_kExact;
+    mutable NodeOfName m_kLowerCase; ///< empty until it is asked for
     std::vector<std::string> m_kNames;
 };
 

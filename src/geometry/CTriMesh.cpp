@@ -27,10 +27,28 @@ bool ComesBefore(const IndexLists& lists, uint32_t a, uint32_t b)
     return false;
 }
 
+// The same for a single list, as bones have it: corners are the values themselves.
+std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uint32_t> vertices)
+{
+    std::vector<int32_t> values(list.begin(), list.begin() + static_cast<ptrdiff_t>(vertices.size()));
+    std::ranges::sort(values);
+    values.erase(std::unique(values.begin(), values.end()), values.end());
+    std::vector<uint32_t> cornerOf(values.size());
+    for (size_t corner = 0; corner < vertices.size(); ++corner)
+    {
+        const auto found = std::ranges::lower_bound(values, static_cast<int32_t>(list[corner]));
+        vertices[corner] = static_cast<uint32_t>(found - values.begin());
+        cornerOf[vertices[corner]] = static_cast<uint32_t>(corner);
+    }
+    return cornerOf;
+}
+
 // Numbers the distinct corners in their order. Each corner's number goes to `vertices`; the answer has for
 // each number a corner that carries it.
 std::vector<uint32_t> NumberCorners(const IndexLists& lists, std::span<uint32_t> vertices)
 {
+    if (lists.size() == 1)
+        return NumberValues(lists.front(), vertices);
     std::vector<uint32_t> order(vertices.size());
     std::iota(order.begin(), order.end(), 0);
     std::ranges::sort(order, [&](uint32_t a, uint32_t b) { return ComesBefore(lists, a, b); });

@@ -248,9 +248,12 @@ bool CObject::Fits(const char* name, const CRTTI* record, bool derived) const
 // Collected first and visited then, so that walks which recurse spend one small frame a level.
 std::vector<CObject*> CObject::HeldObjects()
 {
+    constexpr size_t kUsual = 8; // every search comes by here: growing would take three allocations for a node
     std::vector<CObject*> held;
     CLinkVisitor visitor([&](const CLinkSlot& slot) {
         CObject* object = slot.IsCounted() ? slot.Get() : nullptr;
+        if (object && held.empty())
+            held.reserve(kUsual);
         if (object)
             held.push_back(object);
     });
