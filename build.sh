@@ -121,7 +121,8 @@ bench)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
   build release
   build/release/bin/gaitwright_bench
-  python3 bench/whole_process.py build/release/bin
+  python3 bench/whole_process.py build/release/bin --what convert choose info
+  python3 bench/growth.py build/release/bin
   ;;
 fuzz)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_fuzz[@]}"
