@@ -26,7 +26,8 @@ public:
     {
     }
 
-    void Hold(ProfileChoice& choice);
+    void Match(ProfileChoice& choice) const;
+    void Judge(ProfileChoice& choice);
     const std::vector<std::string>& SourceNames() const { return m_kSourceNames.Names(); }
 
 private:
@@ -45,12 +46,17 @@ private:
     std::optional<SourceBody> m_kBody;
 };
 
-void CSkeletons::Hold(ProfileChoice& choice)
+void CSkeletons::Match(ProfileChoice& choice) const
 {
     CRetargeter table;
     choice.match = ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
-    if (choice.match.IsWhole())
-        choice.verdict = JudgeProfile(table, m_kTarget, Body());
+}
+
+void CSkeletons::Judge(ProfileChoice& choice)
+{
+    CRetargeter table;
+    ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
+    choice.verdict = JudgeProfile(table, m_kTarget, Body());
 }
 
 // Larger is better. A profile of which rows do not fit is ranked by the share of those that do.
@@ -86,7 +92,7 @@ std::vector<ProfileChoice> AdaptedOnes(const ProfileChoice& choice, const std::v
             if (EqualNoCase(oldPrefix, newPrefix))
                 continue;
             whole.push_back(Adapted(choice, oldPrefix, newPrefix));
-            skeletons.Hold(whole.back());
+            skeletons.Match(whole.back());
             if (!whole.back().match.IsWhole())
                 whole.pop_back();
         }
@@ -113,25 +119,41 @@ std::vector<ProfileChoice> AdaptToPrefix(const std::vector<ProfileChoice>& choic
     return whole;
 }
 
+// A verdict costs more than all rows: where only the first one counts, those with fewer rows than another
+// need none.
+void JudgeWhole(std::vector<ProfileChoice>& choices, CSkeletons& skeletons, EJudged judged)
+{
+    int mostRows = 0;
+    for (const ProfileChoice& choice : choices)
+        mostRows = std::max(mostRows, choice.match.IsWhole() ? choice.match.rowCount : 0);
+    for (ProfileChoice& choice : choices)
+    {
+        if (choice.match.IsWhole() && (judged == EJudged::All || choice.match.rowCount == mostRows))
+            skeletons.Judge(choice);
+    }
+}
+
 } // namespace
 
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
-                                         CNode& targetRoot)
+                                         CNode& targetRoot, EJudged judged)
 {
     CSkeletons skeletons(sourceRoot, targetRoot);
     std::vector<ProfileChoice> choices;
+    choices.reserve(paths.size()); // growing would copy all rows
     for (const std::string& path : paths)
     {
         ProfileChoice choice;
         choice.path = path;
         if (!ReadProfileRows(path, choice.profile))
             continue;
-        skeletons.Hold(choice);
+        skeletons.Match(choice);
         choices.push_back(std::move(choice));
     }
     const auto fits = [](const ProfileChoice& choice) { return choice.match.IsWhole(); };
     if (std::ranges::none_of(choices, fits))
         std::ranges::move(AdaptToPrefix(choices, skeletons), std::back_inserter(choices));
+    JudgeWhole(choices, skeletons, judged);
     std::ranges::stable_sort(choices, std::greater(), Rank);
     return choices;
 }

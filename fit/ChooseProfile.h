@@ -3,6 +3,7 @@
 #include "JudgeProfile.h"
 #include "ProfileRows.h"
 
+#include <cstdint>
 #include <span>
 #include <string>
 #include <vector>
@@ -19,12 +20,19 @@ struct ProfileChoice
     ProfileVerdict verdict; ///< of a profile whose rows all fit
 };
 
+/// Which of the profiles that fit get a verdict.
+enum class EJudged : uint8_t
+{
+    All,
+    First, ///< those that may stand first; the others stand behind them in no order that means anything
+};
+
 /// Holds profiles against a source, the best one first. Those of which all rows fit go before the others, and
 /// of them more rows before fewer, then what is not doubtful, then what leaves out fewer spine joints and
 /// turns bones less; the others stand by the share of their rows that fit. What is equal stays in the order
 /// given. Where no profile fits as it is and the source's joints share a prefix, profiles that fit with that
 /// prefix, or without their own one, come first as adapted ones. Files that cannot be read are left out.
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
-                                         CNode& targetRoot);
+                                         CNode& targetRoot, EJudged judged = EJudged::All);
 
 } // namespace gw

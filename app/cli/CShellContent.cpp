@@ -130,14 +130,16 @@ bool CShellContent::SelectProfile(const std::string& nameOrFile)
     return true;
 }
 
-std::vector<ProfileChoice> CShellContent::HoldAgainstSource(std::span<const std::string> paths) const
+std::vector<ProfileChoice> CShellContent::HoldAgainstSource(std::span<const std::string> paths,
+                                                            EJudged judged) const
 {
     CNode* const source = SourceRoot();
     CNode* const target = ResultMotion().motionRoot.Get();
-    return source && target ? gw::ChooseProfile(paths, *source, *target) : std::vector<ProfileChoice>();
+    return source && target ? gw::ChooseProfile(paths, *source, *target, judged)
+                            : std::vector<ProfileChoice>();
 }
 
-std::vector<ProfileChoice> CShellContent::Choices()
+std::vector<ProfileChoice> CShellContent::Choices(EJudged judged)
 {
     std::vector<std::string> paths;
     for (const CInstalledProfile& profile : InstalledProfiles())
@@ -146,7 +148,7 @@ std::vector<ProfileChoice> CShellContent::Choices()
     std::ranges::stable_sort(paths, {}, [&](const std::string& path) {
         return std::ranges::find_if(kLongKnown, [&](const char* file) { return path == ExeFile(file); });
     });
-    std::vector<ProfileChoice> choices = HoldAgainstSource(paths);
+    std::vector<ProfileChoice> choices = HoldAgainstSource(paths, judged);
     const auto pick = std::ranges::find(choices, ProfilePath(), &ProfileChoice::path);
     if (pick != choices.end())
         std::rotate(choices.begin(), pick, pick + 1);
@@ -157,7 +159,7 @@ bool CShellContent::SelectFittingProfile(const std::string& source, std::optiona
 {
     if (!ProfilePath().empty())
         return KeepStockPick(source);
-    const std::vector<ProfileChoice> choices = Choices();
+    const std::vector<ProfileChoice> choices = Choices(EJudged::First);
     if (!choices.empty() && choices.front().match.IsWhole())
         return Take(source, choices.front());
     nearest.emplace();
@@ -171,7 +173,7 @@ bool CShellContent::SelectFittingProfile(const std::string& source, std::optiona
 bool CShellContent::KeepStockPick(const std::string& source)
 {
     const std::string path[] = {ProfilePath()};
-    for (ProfileChoice& choice : HoldAgainstSource(path))
+    for (ProfileChoice& choice : HoldAgainstSource(path, EJudged::All))
     {
         std::erase_if(choice.verdict.doubts,
                       [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });

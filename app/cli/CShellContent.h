@@ -50,7 +50,7 @@ public:
     bool SelectProfile(const std::string& nameOrFile);
     /// The installed profiles, the best one for the open source first: the stock profile that was chosen when
     /// it was opened, then by ChooseProfile.
-    std::vector<ProfileChoice> Choices();
+    std::vector<ProfileChoice> Choices(EJudged judged = EJudged::All);
     /// Sees to it that a profile is selected: the first of the choices. False, with the reason said, where no
     /// profile fits, when `nearest` tells how far the nearest one does, and where the first one is doubtful.
     bool SelectFittingProfile(const std::string& source, std::optional<CProfileFit>& nearest);
@@ -69,7 +69,7 @@ public:
     void PickStockProfile() override;
 
 private:
-    std::vector<ProfileChoice> HoldAgainstSource(std::span<const std::string> paths) const;
+    std::vector<ProfileChoice> HoldAgainstSource(std::span<const std::string> paths, EJudged judged) const;
     bool KeepStockPick(const std::string& source);
     bool Take(const std::string& source, const ProfileChoice& choice);
     bool SelectAdapted(const ProfileChoice& choice);

@@ -35,7 +35,11 @@ protected:
 
     std::vector<ProfileChoice> Of(CNode& source, const std::vector<std::string>& paths = StockPaths())
     {
-        return ChooseProfile(paths, source, *m_kTarget.motionRoot);
+        std::vector<ProfileChoice> all = ChooseProfile(paths, source, *m_kTarget.motionRoot);
+        const auto some = ChooseProfile(paths, source, *m_kTarget.motionRoot, EJudged::First);
+        EXPECT_EQ(some.empty() ? "" : some.front().path, all.empty() ? "" : all.front().path);
+        EXPECT_EQ(some.empty() ? "" : some.front().profile.name, all.empty() ? "" : all.front().profile.name);
+        return all;
     }
     /// Writes a profile that drives the hips and what else is told.
     std::string Profile(const std::string& name, const std::string& rows)
