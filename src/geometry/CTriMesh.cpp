@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <numeric>
+#include <utility>
 
 namespace gw {
 
@@ -27,19 +28,24 @@ bool ComesBefore(const IndexLists& lists, uint32_t a, uint32_t b)
     return false;
 }
 
-// The same for a single list, as bones have it: corners are the values themselves.
+// The same for a single list of values below the number of corners, as every bone has it.
 std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uint32_t> vertices)
 {
-    std::vector<int32_t> values(list.begin(), list.begin() + static_cast<ptrdiff_t>(vertices.size()));
-    std::ranges::sort(values);
-    values.erase(std::unique(values.begin(), values.end()), values.end());
-    std::vector<uint32_t> cornerOf(values.size());
+    std::vector<uint32_t> cornerOf;
+    std::vector<uint32_t> numberOf(vertices.size());
+    std::vector<bool> isUsed(vertices.size());
     for (size_t corner = 0; corner < vertices.size(); ++corner)
     {
-        const auto found = std::ranges::lower_bound(values, static_cast<int32_t>(list[corner]));
-        vertices[corner] = static_cast<uint32_t>(found - values.begin());
-        cornerOf[vertices[corner]] = static_cast<uint32_t>(corner);
+        isUsed[list[corner]] = true;
+        numberOf[list[corner]] = static_cast<uint32_t>(corner);
     }
+    for (size_t value = 0; value < vertices.size(); ++value)
+    {
+        if (isUsed[value])
+            cornerOf.push_back(std::exchange(numberOf[value], static_cast<uint32_t>(cornerOf.size())));
+    }
+    std::ranges::transform(list.first(vertices.size()), vertices.begin(),
+                           [&](uint32_t value) { return numberOf[value]; });
     return cornerOf;
 }
 
@@ -47,7 +53,8 @@ std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uin
 // each number a corner that carries it.
 std::vector<uint32_t> NumberCorners(const IndexLists& lists, std::span<uint32_t> vertices)
 {
-    if (lists.size() == 1)
+    const auto isBelow = [&](uint32_t value) { return value < vertices.size(); };
+    if (lists.size() == 1 && std::ranges::all_of(lists.front().first(vertices.size()), isBelow))
         return NumberValues(lists.front(), vertices);
     std::vector<uint32_t> order(vertices.size());
     std::iota(order.begin(), order.end(), 0);

@@ -3,6 +3,7 @@
 #include "CMappedFile.h"
 #include "Numbers.h"
 #include "Paths.h"
+#include "Skeleton.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -62,6 +63,13 @@ private:
     int m_iCount = 0;
 };
 
+CNode* NodeOfName(const std::vector<CNode*>& nodes, std::string_view name)
+{
+    const auto has = [=](const CNode* node) { return node->GetName() && node->NameView() == name; };
+    const auto found = std::ranges::find_if(nodes, has);
+    return found == nodes.end() ? nullptr : *found;
+}
+
 template <class T>
 const T* Find(const std::map<const CNode*, T>& table, const CNode* node)
 {
@@ -99,6 +107,7 @@ bool CRetargeter::LoadShares(const std::string& path)
     if (failure != EFailure::None)
         return false;
     std::string_view rest = SkipByteOrderMark(file.Text());
+    const std::vector<CNode*> nodes = m_pkTargetRoot ? NodesOf(*m_pkTargetRoot) : std::vector<CNode*>();
     CBoneShares shares;
     for (std::string_view line; NextLine(rest, line);)
     {
@@ -109,10 +118,7 @@ bool CRetargeter::LoadShares(const std::string& path)
             line.remove_prefix(std::min(line.size(), kShareLineLimit));
             if (!reader.HasNumbers())
                 continue;
-            CObject* node = m_pkTargetRoot
-                                ? m_pkTargetRoot->FindObject(reader.Name().c_str(), &CNode::ms_kRTTI, true)
-                                : nullptr;
-            SetShares(static_cast<CNode*>(node), shares);
+            SetShares(NodeOfName(nodes, reader.Name().c_str()), shares);
         } while (!line.empty());
     }
     return true;
