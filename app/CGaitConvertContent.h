@@ -194,6 +194,7 @@ private:
 
     // ConvertMotion.cpp
     SourceTiming ConversionTiming() const;
+    void TakeFreshResult();
     bool PrepareRetargeter();
     bool PrepareSource(const SourceTiming& timing);
     void Retarget(const SourceTiming& timing, bool useLegs);
@@ -258,6 +259,7 @@ private:
     std::string m_kSourcePath;                ///< of the file that was opened last
     CMotionFile m_kBaseMotion;                ///< base.htr as it is, for the editor's target tree
     CMotionFile m_kResultMotion;              ///< base.htr again, into which the motion is baked
+    bool m_bResultIsFresh = false;            ///< nothing was baked into it, nor was it posed
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;

@@ -42,7 +42,7 @@ int CGaitConvertContent::ConvertMotion()
 {
     const CWaitCursor wait(m_kWindow);
     ForViews(&CMotionView::Stop);
-    LoadMotion(m_kResultMotion, BaseFile());
+    TakeFreshResult();
     if (m_pkProfile)
         m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
     const SourceTiming timing = ConversionTiming();
@@ -58,6 +58,16 @@ int CGaitConvertContent::ConvertMotion()
     m_bConverted = true;
     UpdateControls();
     return 1;
+}
+
+// A conversion begins with the skeleton as its file has it. What the opening has read is that still, the first
+// time.
+void CGaitConvertContent::TakeFreshResult()
+{
+    if (m_bResultIsFresh)
+        Report(BaseFile(), m_kResultMotion.Record());
+    else
+        LoadMotion(m_kResultMotion, BaseFile());
 }
 
 // Fills a retargeter's tables from the profile. It is a new one: tables are keyed by the target's bones, and
@@ -97,6 +107,7 @@ bool CGaitConvertContent::PrepareSource(const SourceTiming& timing)
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
 {
+    m_bResultIsFresh = false;
     m_kRetargeter->SetFaithful(m_kChoices.faithful);
     m_kRetargeter->SetProgress([this](size_t done, size_t total) { ShowProgress(done, total); });
     m_kRetargeter->Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);
