@@ -3,7 +3,7 @@
 
     bench/growth.py BIN_FOLDER [--svg FILE] [--runs N]
 
-CPU time of whole processes; the least of some runs, in turns over all sizes, since what others do on a machine only adds.
+CPU time of whole processes; the least of some runs, in turns over all sizes: what others do on a machine only adds.
 For both rows of sizes prints each, the fitted line and how far the worst size lies from it, in percent of the largest
 value.
 """
@@ -20,11 +20,11 @@ FRAMES = (1_000, 10_000, 25_000, 40_000, 55_000, 70_000, 85_000, 100_000)
 FRAMES_OF_JOINTS, JOINTS_OF_FRAMES = 4_000, 25
 
 WIDTH, HEIGHT, LEFT, TOP, GAP = 380, 250, 64, 44, 90
-STYLE = """
-text { font: 13px sans-serif; fill: #24292f } .axis, .tick { stroke: #57606a; fill: none } .tick { stroke-width: 0.5 }
-.line { stroke: #0969da; stroke-width: 1.5 } .point { fill: #bc4c00 }
-@media (prefers-color-scheme: dark) { text { fill: #e6edf3 } .axis, .tick { stroke: #8b949e }
-.line { stroke: #58a6ff } .point { fill: #ffa657 } }"""
+# Colours stand in the elements, for viewers that read no style; the style is for dark pages.
+STYLE = """@media (prefers-color-scheme: dark) {
+text { fill: #e6edf3 } .axis { stroke: #8b949e } .line { stroke: #58a6ff } .point { fill: #ffa657 } }"""
+TEXT = 'font-family="sans-serif" font-size="13" fill="#24292f"'
+AXIS = 'class="axis" fill="none" stroke="#57606a" stroke-width="%g"'
 
 
 def fit(points):
@@ -50,18 +50,20 @@ def panel(points, left, title, unit):
     across, up = steps(max(x for x, _ in points)), steps(max(y for _, y in points))
     at_x = lambda x: left + WIDTH * x / across[-1]
     at_y = lambda y: TOP + HEIGHT * (1 - y / up[-1])
-    out = ['<text x="%d" y="%d">%s</text>' % (left, TOP - 20, title)]
+    out = ['<text %s x="%d" y="%d">%s</text>' % (TEXT, left, TOP - 20, title)]
     for y in up:
-        out.append('<path class="tick" d="M%.1f %.1fh%d"/>' % (left, at_y(y), WIDTH))
-        out.append('<text x="%.1f" y="%.1f" text-anchor="end">%g</text>' % (left - 8, at_y(y) + 4, y))
+        out.append('<path %s d="M%.1f %.1fh%d"/>' % (AXIS % 0.4, left, at_y(y), WIDTH))
+        out.append('<text %s x="%.1f" y="%.1f" text-anchor="end">%g</text>' % (TEXT, left - 8, at_y(y) + 4, y))
     for x in across:
-        out.append('<text x="%.1f" y="%d" text-anchor="middle">%s</text>' % (at_x(x), TOP + HEIGHT + 20, "{:,}".format(x)))
-    out.append('<path class="axis" d="M%d %dv%dh%d"/>' % (left, TOP, HEIGHT, WIDTH))
+        out.append('<text %s x="%.1f" y="%d" text-anchor="middle">%s</text>' %
+                   (TEXT, at_x(x), TOP + HEIGHT + 20, "{:,}".format(x)))
+    out.append('<path %s d="M%d %dv%dh%d"/>' % (AXIS % 1, left, TOP, HEIGHT, WIDTH))
     offset, slope = fit(points)
     ends = [(x, offset + slope * x) for x in (0, across[-1])]
-    out.append('<path class="axis line" d="M%.1f %.1fL%.1f %.1f"/>' % tuple(p for x, y in ends for p in (at_x(x), at_y(y))))
-    out += ['<circle class="point" cx="%.1f" cy="%.1f" r="3.5"/>' % (at_x(x), at_y(y)) for x, y in points]
-    out.append('<text x="%d" y="%d" text-anchor="middle">%s</text>' % (left + WIDTH // 2, TOP + HEIGHT + 42, unit))
+    out.append('<path class="line" stroke="#0969da" stroke-width="1.5" d="M%.1f %.1fL%.1f %.1f"/>' %
+               tuple(p for x, y in ends for p in (at_x(x), at_y(y))))
+    out += ['<circle class="point" fill="#bc4c00" cx="%.1f" cy="%.1f" r="3.5"/>' % (at_x(x), at_y(y)) for x, y in points]
+    out.append('<text %s x="%d" y="%d" text-anchor="middle">%s</text>' % (TEXT, left + WIDTH // 2, TOP + HEIGHT + 42, unit))
     return out
 
 
