@@ -60,8 +60,8 @@ int CGaitConvertContent::ConvertMotion()
     return 1;
 }
 
-// A conversion begins with the skeleton as its file has it. What the opening has read is that still, the first
-// time.
+// A conversion begins with the skeleton as its file has it. What the opening has read is that still, the
+// first time.
 void CGaitConvertContent::TakeFreshResult()
 {
     if (m_bResultIsFresh)
