@@ -18,11 +18,21 @@ constexpr std::string_view kMaker = "Tessarine";
 constexpr std::string_view kProgramFile = "Tessarine/Gaitwright.conf";
 constexpr std::string_view kMakerFile = "Tessarine.conf"; // what all programs of the maker share
 constexpr std::string_view kSection = "Settings";
+constexpr const char* kTargetFile = "base.htr";
+constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // of an installation
 
 std::string Environment(const char* name)
 {
     const char* value = std::getenv(name);
     return value ? value : "";
+}
+
+// Beside the executable, as in a build. An installation keeps apart what is the same on every machine.
+std::string OwnDataFolder()
+{
+    std::string beside = ExecutableFolder();
+    std::string shared = PathFrom(beside, kSharedFolder);
+    return !FileExists(beside + kTargetFile) && FolderExists(shared) ? shared : beside;
 }
 
 // An environment variable that holds an absolute path; relative ones do not count.
@@ -88,7 +98,7 @@ bool SplitKeyPath(const std::string& keyPath, std::string& product, std::string&
 
 CFilePlatform::CFilePlatform(EPlatformWriting writing, std::string dataFolder)
     : m_bWriting(writing == EPlatformWriting::Yes),
-      m_kDataFolder(WithSeparator(dataFolder.empty() ? ExecutableFolder() : std::move(dataFolder))),
+      m_kDataFolder(WithSeparator(dataFolder.empty() ? OwnDataFolder() : std::move(dataFolder))),
       m_kHome(AbsolutePath("HOME", "/")),
       m_kUserFolder(WithSeparator(AbsolutePath("XDG_CONFIG_HOME", WithSeparator(m_kHome) + ".config"))),
       m_kSystemFolders(SplitList(Environment("XDG_CONFIG_DIRS")))

@@ -20,7 +20,7 @@ enum class EPlatformWriting
 class CFilePlatform : public CPlatform
 {
 public:
-    /// The data folder replaces the one beside the executable unless it is empty.
+    /// The data folder replaces the program's own unless it is empty: the executable's, or an installation's.
     explicit CFilePlatform(EPlatformWriting writing, std::string dataFolder = {});
 
     std::string ReadSetting(const std::string& key) const override;

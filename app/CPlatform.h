@@ -21,8 +21,8 @@ public:
 
     /// The user's documents folder.
     virtual std::string DocumentsFolder() const = 0;
-    /// The folder of base.htr and the stock profiles with its trailing separator: beside the executable,
-    /// unless another was named.
+    /// The folder of base.htr and the stock profiles with its trailing separator: the executable's or an
+    /// installation's, unless another was named.
     virtual std::string DataFolder() const = 0;
     /// Makes a folder; an existing one is no error. A platform that stores nothing makes none.
     virtual bool MakeFolder(const std::string& path) = 0;

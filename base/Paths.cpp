@@ -11,6 +11,7 @@
 #include <system_error>
 
 #include <dirent.h>
+#include <sys/auxv.h>
 #include <sys/stat.h>
 #include <unistd.h>
 
@@ -145,10 +146,18 @@ std::vector<std::string> FilesInFolder(const std::string& folder, std::string_vi
     return names;
 }
 
+std::string PathFrom(const std::string& folder, const std::string& relative)
+{
+    return TextOf((NativePath(folder) / NativePath(relative)).lexically_normal());
+}
+
 std::string ExecutableFolder()
 {
     std::error_code error;
-    return SplitPath(TextOf(fs::read_symlink("/proc/self/exe", error))).folder;
+    fs::path program = fs::read_symlink("/proc/self/exe", error);
+    if (error) // a root without /proc, as some are that packages are tried in
+        program = fs::canonical(reinterpret_cast<const char*>(getauxval(AT_EXECFN)), error);
+    return SplitPath(TextOf(program)).folder;
 }
 
 } // namespace gw

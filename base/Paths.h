@@ -50,7 +50,9 @@ std::vector<std::string> NamesInFolder(const std::string& folder);
 /// name order, so that a run is the same everywhere. Private files are passed over.
 std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
 
-/// The folder of the running program with its trailing separator.
+/// A relative path seen from a folder without links, with its ".." carried out.
+std::string PathFrom(const std::string& folder, const std::string& relative);
+/// The folder of the running program with its trailing separator. Links to the program are followed.
 std::string ExecutableFolder();
 
 } // namespace gw

@@ -1,0 +1,49 @@
+# Where an installation keeps things. The programs stand beside their modules, with links where a shell looks for
+# them. What they need besides is found from there, so that an installation may be moved as a whole.
+if(CMAKE_LIBRARY_ARCHITECTURE)
+  # As Debian has it. By itself CMake does so below /usr only, which an installation to be packaged is not made for.
+  set(CMAKE_INSTALL_LIBDIR lib/${CMAKE_LIBRARY_ARCHITECTURE} CACHE PATH "Object code libraries")
+endif()
+include(GNUInstallDirs)
+
+set(GAITWRIGHT_PROGRAMS ${CMAKE_INSTALL_LIBDIR}/gaitwright)
+set(GAITWRIGHT_SHARED ${CMAKE_INSTALL_DATADIR}/gaitwright)
+file(RELATIVE_PATH GAITWRIGHT_SHARED_FROM_PROGRAMS ${CMAKE_INSTALL_FULL_LIBDIR}/gaitwright
+     ${CMAKE_INSTALL_FULL_DATADIR}/gaitwright)
+
+# gw_rooms_seen(RESULT targets...): the targets themselves and all rooms that they see.
+function(gw_rooms_seen result)
+  set(ahead ${ARGN})
+  set(seen)
+  while(ahead)
+    list(POP_FRONT ahead room)
+    if(TARGET ${room} AND room MATCHES "^gw_" AND NOT room IN_LIST seen)
+      list(APPEND seen ${room})
+      get_target_property(links ${room} LINK_LIBRARIES)
+      if(links)
+        list(APPEND ahead ${links})
+      endif()
+    endif()
+  endwhile()
+  set(${result} ${seen} PARENT_SCOPE)
+endfunction()
+
+# gw_modules_below(RESULT FOLDER): the modules that are built beside the programs, in a folder's CMake files and
+# those below.
+function(gw_modules_below result folder)
+  get_directory_property(targets DIRECTORY ${folder} BUILDSYSTEM_TARGETS)
+  get_directory_property(folders DIRECTORY ${folder} SUBDIRECTORIES)
+  set(modules)
+  foreach(target IN LISTS targets)
+    get_target_property(type ${target} TYPE)
+    get_target_property(output ${target} LIBRARY_OUTPUT_DIRECTORY)
+    if(type STREQUAL MODULE_LIBRARY AND output STREQUAL CMAKE_RUNTIME_OUTPUT_DIRECTORY)
+      list(APPEND modules ${target})
+    endif()
+  endforeach()
+  foreach(below IN LISTS folders)
+    gw_modules_below(more ${below})
+    list(APPEND modules ${more})
+  endforeach()
+  set(${result} ${modules} PARENT_SCOPE)
+endfunction()
