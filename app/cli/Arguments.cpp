@@ -1,5 +1,7 @@
 #include "Arguments.h"
 
+#include "Completion.h"
+#include "ManPage.h"
 #include "Numbers.h"
 #include "OptionTable.h"
 #include "Text.h"
@@ -220,12 +222,35 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
     return std::nullopt;
 }
 
-EExit ParseWithoutCommand(std::string_view word)
+std::string Version()
 {
-    if (word == "--help" || word == "-h")
-        return Print(ProgramHelp());
-    if (word == "--version")
-        return Print("gaitwright " GAITWRIGHT_VERSION "\n");
+    return "gaitwright " GAITWRIGHT_VERSION "\n";
+}
+
+// What the program tells of itself, in the place of a command. The last ones are for who packages it.
+struct CSelfRow
+{
+    std::string_view words;
+    std::string (*text)();
+};
+constexpr CSelfRow kSelf[] = {
+    {"--help",            ProgramHelp   },
+    {"-h",                ProgramHelp   },
+    {"--version",         Version       },
+    {"--man-page",        ManPage       },
+    {"--completion bash", BashCompletion},
+    {"--completion fish", FishCompletion},
+    {"--completion zsh",  ZshCompletion },
+};
+
+EExit ParseWithoutCommand(std::string_view word, std::string_view next)
+{
+    const std::string both = std::string(word) + ' ' + std::string(next);
+    for (const CSelfRow& row : kSelf)
+    {
+        if (row.words == word || row.words == both)
+            return Print(row.text());
+    }
     const std::string remedy = "'gaitwright --help' lists the commands";
     if (word.empty())
         return Refuse("a command is missing", {}, remedy);
@@ -241,7 +266,7 @@ CArguments ParseArguments(int argc, char** argv)
     const auto command = std::ranges::find(Commands(), word, &CCommand::name);
     if (command == Commands().end())
     {
-        arguments.exit = ParseWithoutCommand(word);
+        arguments.exit = ParseWithoutCommand(word, argc > 2 ? argv[2] : "");
         return arguments;
     }
     const std::optional<EExit> end = ParseFor(*command, argc - 1, argv + 1, arguments.options);

@@ -130,7 +130,8 @@ std::string ProgramHelp()
     for (const CCommand& command : Commands())
         AppendRow(text, command.name, FirstLine(command.help));
     text += "\n'gaitwright COMMAND --help' shows the options of a command and an example.\n"
-            "Exit codes: 0 done, 1 some work failed, 2 wrong usage, 130 interrupted.\n\nExample:\n  ";
+            "Exit codes: " +
+            std::string(kExitCodes) + "\n\nExample:\n  ";
     return text + std::string(Commands().front().example) + '\n';
 }
 

@@ -27,6 +27,9 @@ struct COptionRow
 /// The table of options, in the order of the help.
 std::span<const COptionRow> OptionTable();
 
+/// What the program's answer to the shell means.
+inline constexpr std::string_view kExitCodes = "0 done, 1 some work failed, 2 wrong usage, 130 interrupted.";
+
 /// The bits of all options that a command takes.
 uint64_t OptionsOf(const CCommand& command);
 
