@@ -7,6 +7,7 @@
 #   ./build.sh asan         the same tests under AddressSanitizer and UndefinedBehaviorSanitizer
 #   ./build.sh bench        runs the benchmarks: ratios within one run
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
+#   ./build.sh package      makes Debian packages in build/release/packages and tries them
 #   ./build.sh cluster-test runs the lines of docs/clusters.md with Slurm and GNU parallel on this machine
 #   ./build.sh lint         checks formatting and runs the linter
 set -euo pipefail
@@ -17,7 +18,8 @@ packages_build=(g++ cmake ninja-build pkg-config ccache)
 packages_engine=(libcli11-dev nlohmann-json3-dev libxxhash-dev libmagick++-6.q16-dev)
 packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libgl1-mesa-dri)
 packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libgl1-mesa-dri fonts-dejavu-core)
-packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon)
+packages_package=(dpkg-dev file lintian desktop-file-utils appstream shared-mime-info man-db)
+packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon zsh fish "${packages_package[@]}")
 packages_bench=(libbenchmark-dev libassimp-dev python3 time)
 packages_cluster=(slurm-wlm munge parallel)
 packages_lint=(clang-format clang-tidy)
@@ -111,6 +113,12 @@ test)
   build release
   run_tests release
   ;;
+package)
+  prepare
+  build release
+  ctest --test-dir build/release --output-on-failure --no-tests=error -R '^package' -j "$(nproc)"
+  ls -l build/release/packages/*.deb
+  ;;
 asan)
   prepare
   build asan
@@ -142,7 +150,7 @@ lint)
   git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
   ;;
 *)
-  sed -n '4,12s/^# *//p' "$0"
+  sed -n '4,13s/^# *//p' "$0"
   exit 2
   ;;
 esac

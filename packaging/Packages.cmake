@@ -1,0 +1,55 @@
+# Debian packages of the components.
+set(CPACK_PACKAGE_NAME gaitwright)
+set(CPACK_PACKAGE_CONTACT "Gaitwright developers <gaitwright@example.org>")
+set(CPACK_PACKAGE_VENDOR "Gaitwright developers")
+set(CPACK_PACKAGING_INSTALL_PREFIX /usr)
+set(CPACK_GENERATOR DEB)
+set(CPACK_STRIP_FILES ON)
+set(CPACK_INSTALL_DEFAULT_DIRECTORY_PERMISSIONS OWNER_READ OWNER_WRITE OWNER_EXECUTE GROUP_READ GROUP_EXECUTE
+                                                WORLD_READ WORLD_EXECUTE)
+set(CPACK_COMPONENTS_ALL ${GAITWRIGHT_COMPONENTS})
+set(CPACK_COMPONENTS_GROUPING IGNORE)
+set(CPACK_DEB_COMPONENT_INSTALL ON)
+set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
+set(CPACK_DEBIAN_COMPRESSION_TYPE xz)
+set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
+set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
+
+foreach(component package IN ZIP_LISTS GAITWRIGHT_COMPONENTS GAITWRIGHT_PACKAGES)
+  string(TOUPPER ${component} COMPONENT)
+  set(CPACK_DEBIAN_${COMPONENT}_PACKAGE_NAME ${package})
+endforeach()
+
+# A picture is drawn by a driver that is loaded by name.
+set(CPACK_DEBIAN_SHELL_PACKAGE_SECTION graphics)
+set(CPACK_DEBIAN_SHELL_PACKAGE_RECOMMENDS libgl1-mesa-dri)
+set(CPACK_COMPONENT_SHELL_DESCRIPTION
+    "motion capture converted to one fixed skeleton, in the shell
+Reads BVH, HTR, CHA and CHB motions and scene containers with keyframed
+bones, moves them onto the target skeleton by a bone map, plants the feet,
+and writes Kinetra files. Whole archives convert in one run.
+.
+This package holds the command line program, which needs no display, the
+target skeleton and the bone maps of common conventions.")
+
+# So are the plugin that opens windows and the letters in them.
+set(CPACK_DEBIAN_DESKTOP_PACKAGE_SECTION graphics)
+set(CPACK_DEBIAN_DESKTOP_PACKAGE_DEPENDS
+    "gaitwright (= ${PROJECT_VERSION}), qt6-qpa-plugins, libgl1-mesa-dri")
+set(CPACK_DEBIAN_DESKTOP_PACKAGE_RECOMMENDS "fonts-dejavu-core | fonts-freefont-ttf")
+set(CPACK_COMPONENT_DESKTOP_DESCRIPTION
+    "motion capture converted to one fixed skeleton, in a window
+Opens a BVH, HTR, CHA or CHB motion, converts it by a bone map, plays source
+and result side by side, and saves a Kinetra file. An editor makes and
+changes bone maps.")
+
+set(CPACK_DEBIAN_DEVELOP_PACKAGE_SECTION libdevel)
+set(CPACK_DEBIAN_DEVELOP_PACKAGE_SHLIBDEPS OFF) # there is nothing that could have any
+set(CPACK_DEBIAN_DEVELOP_PACKAGE_DEPENDS "gaitwright (= ${PROJECT_VERSION})")
+set(CPACK_COMPONENT_DEVELOP_DESCRIPTION
+    "engine of Gaitwright for other programs, development files
+Static libraries, headers and a CMake package for programs that read, convert
+and write motions themselves: the readers and writers, the scene library, the
+retargeter and the conversion's state machine. No toolkit is needed.")
+
+include(CPack)
