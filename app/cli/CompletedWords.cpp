@@ -22,6 +22,8 @@ constexpr CWordRow kWords[] = {
     {"SOURCE",    EOffer::Files,    "bvh htr cha chb orn"},
     {"RESULT",    EOffer::Files,    "kinetra htr orn bvh"},
     {"PAGE",      EOffer::Files,    "html htm"           },
+    {"PLAN",      EOffer::Files,    "jsonl"              },
+    {"REPORT",    EOffer::Files,    "jsonl"              },
     {"NAME|FILE", EOffer::Profiles, "prf"                },
 };
 
