@@ -19,7 +19,7 @@ packages_engine=(libcli11-dev nlohmann-json3-dev libxxhash-dev libmagick++-6.q16
 packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libgl1-mesa-dri)
 packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libgl1-mesa-dri fonts-dejavu-core)
 packages_package=(dpkg-dev file lintian desktop-file-utils appstream shared-mime-info man-db)
-packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon zsh fish "${packages_package[@]}")
+packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth dbus-daemon zsh fish)
 packages_bench=(libbenchmark-dev libassimp-dev python3 time)
 packages_cluster=(slurm-wlm munge parallel)
 packages_lint=(clang-format clang-tidy)
@@ -54,7 +54,8 @@ run_tests() {
 }
 
 prepare() {
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" libbenchmark-dev
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" \
+    "${packages_package[@]}" libbenchmark-dev
 }
 
 demo() {
