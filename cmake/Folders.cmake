@@ -1,8 +1,9 @@
 # Where an installation keeps things. The programs stand beside their modules, with links where a shell looks for
 # them. What they need besides is found from there, so that an installation may be moved as a whole.
-if(CMAKE_LIBRARY_ARCHITECTURE)
-  # As Debian has it. By itself CMake does so below /usr only, which an installation to be packaged is not made for.
-  set(CMAKE_INSTALL_LIBDIR lib/${CMAKE_LIBRARY_ARCHITECTURE} CACHE PATH "Object code libraries")
+if(CMAKE_LIBRARY_ARCHITECTURE AND (NOT DEFINED CMAKE_INSTALL_LIBDIR OR CMAKE_INSTALL_LIBDIR STREQUAL "lib"))
+  # As Debian has it. By itself CMake does so below /usr only, which an installation to be packaged is not made for,
+  # and keeps "lib" in a folder that was configured so.
+  set(CMAKE_INSTALL_LIBDIR lib/${CMAKE_LIBRARY_ARCHITECTURE} CACHE PATH "Object code libraries" FORCE)
 endif()
 include(GNUInstallDirs)
 

@@ -9,7 +9,7 @@ README = (harness.ROOT / "README.md").read_text(encoding="utf-8")
 
 
 def pages():
-    return [harness.ROOT / "CHANGELOG.md", harness.ROOT / "SECURITY.md", *sorted(DOCS.rglob("*.md"))]
+    return [*(harness.ROOT / name for name in ("README.md", "CHANGELOG.md", "SECURITY.md")), *sorted(DOCS.rglob("*.md"))]
 
 
 def links_of(text):
@@ -30,13 +30,19 @@ class WholeTest(harness.CliTest):
 
     def test_every_page_can_be_found(self):
         """A page that nothing leads to is read by nobody."""
-        led_to = {(page.parent / link.split("#")[0]).resolve() for page in (harness.ROOT / "README.md", *pages())
+        led_to = {(page.parent / link.split("#")[0]).resolve() for page in pages()
                   for link in links_of(page.read_text(encoding="utf-8"))}
         alone = [page for page in DOCS.rglob("*.md") if page.resolve() not in led_to and page.parent.name != "adr"]
         self.assertEqual(alone, [])
 
+    def test_sources_are_shown_as_they_are(self):
+        shown = re.findall(r"^```cpp (\S+)\n(.*?)^```$", README, re.M | re.S)
+        self.assertGreater(len(shown), 0)
+        for path, text in shown:
+            self.assertIn(text, (harness.ROOT / path).read_text(encoding="utf-8"), path)
+
     def test_every_picture_is_shown(self):
-        shown = "".join(page.read_text(encoding="utf-8") for page in (harness.ROOT / "README.md", *pages()))
+        shown = "".join(page.read_text(encoding="utf-8") for page in pages())
         self.assertEqual([p.name for p in DOCS.glob("images/*.png") if p.name not in shown], [])
 
     def test_the_readme_tells_of_every_command(self):
