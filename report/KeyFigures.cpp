@@ -170,7 +170,8 @@ std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const Co
     for (const Row& row : kRows)
     {
         const Optional value = row.value(measures, detail);
-        figures.push_back({row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value), MarkOf(row)});
+        figures.push_back(
+            {row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value), MarkOf(row)});
     }
     return figures;
 }

@@ -204,8 +204,8 @@ void CObject::DumpTable(CHTMLTables& tables)
     for (CControl* control = GetControl(); control && shown.insert(control).second;
          control = control->GetNext())
     {
-        controls += HTMLLineBreak() + HTMLAnchor(GetHTMLFileName(*control, EHTMLPath::Relative),
-                                                 control->GetRTTI()->m_pcName);
+        controls += HTMLLineBreak() +
+                    HTMLAnchor(GetHTMLFileName(*control, EHTMLPath::Relative), control->GetRTTI()->m_pcName);
         tables.Follow(*control);
     }
     tables.Begin(ms_kRTTI);
@@ -248,7 +248,8 @@ bool CObject::Fits(const char* name, const CRTTI* record, bool derived) const
 // Collected first and visited then, so that walks which recurse spend one small frame a level.
 std::vector<CObject*> CObject::HeldObjects()
 {
-    constexpr size_t kUsual = 8; // every search comes by here: growing would take three allocations for a node
+    constexpr size_t kUsual =
+        8; // every search comes by here: growing would take three allocations for a node
     std::vector<CObject*> held;
     CLinkVisitor visitor([&](const CLinkSlot& slot) {
         CObject* object = slot.IsCounted() ? slot.Get() : nullptr;

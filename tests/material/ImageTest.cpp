@@ -282,10 +282,10 @@ TEST(CAnmImageControl, DrawsTheFrameOfItsTimeAtItsPlace)
         float time;
         std::array<uint8_t, 3> shades;
     } rows[] = {
-        {"before the second frame", 69.0f,  {10, 0, 0} },
-        {"with it",                 70.0f,  {0, 20, 0} },
-        {"with the empty one",      500.0f, {0, 0, 0}  },
-        {"back again",              1.0f,   {10, 0, 0} },
+        {"before the second frame", 69.0f,  {10, 0, 0}},
+        {"with it",                 70.0f,  {0, 20, 0}},
+        {"with the empty one",      500.0f, {0, 0, 0} },
+        {"back again",              1.0f,   {10, 0, 0}},
     };
     uint32_t stamp = screen->m_uiChangeStamp;
     for (const auto& row : rows)
