@@ -1,12 +1,12 @@
 #!/usr/bin/env python3
 """Converts an archive of many files by several processes, and says how fast, how whole and how alike.
 
-    bench/many_files.py BIN_FOLDER [--count 10000] [--loop PROGRAM]
+    bench/many_files.py BIN_FOLDER [--count 10000] [--loop]
 
 Every hundredth file is broken. Prints the time and rate of a first run, the time of a second one that finds all done,
 whether one process and eight leave the same bytes, and the share of the workers' time that went into conversions.
-With --loop, a program that converts a list one by one in its own process (a build without workers), both share the
-archive in turns: two loops at a time, each on half of it and on a core of its own, against --jobs 2.
+With --loop, two of the programs that convert a folder in their own process (convert_loop), each on half of the archive
+and on a core of its own, are measured in turns against --jobs 2 on the whole.
 """
 import argparse
 import hashlib
@@ -50,9 +50,8 @@ class Bench:
     def __init__(self, bin_folder, work):
         self.program, self.work = Path(bin_folder).resolve() / "gaitwright", work
 
-    def command(self, out, *options, program=None, sources="archive"):
-        return [str(program or self.program), "convert", sources, "--out-dir", out, "--keep-going", "--quiet",
-                "--data-dir", str(self.program.parent), *options]
+    def command(self, out, *options):
+        return [str(self.program), "convert", "archive", "--out-dir", out, "--keep-going", "--quiet", *options]
 
     def run(self, out, *options):
         start = time.monotonic()
@@ -85,27 +84,25 @@ class Bench:
             print("--jobs %s: %.1f s" % (jobs, seconds))
         print("--jobs 1, 2 and 8: " + ("the same bytes" if len(set(digests.values())) == 1 else "OTHER BYTES"))
 
-    def against_loop(self, loop, rounds=5):
+    def against_loop(self, rounds=5):
         """In turns, so that a noisy machine slows both alike."""
-        halves = [[], []]
-        for number, folder in enumerate(sorted((self.work / "archive").iterdir())):
-            halves[number % 2].append(folder)
-        for half, folders in enumerate(halves):
-            (self.work / ("half%d" % half)).mkdir()
-            for path in (path for folder in folders for path in folder.iterdir()):
-                os.link(path, self.work / ("half%d" % half) / path.name)
+        profile = str(self.program.parent / "PoserBVH.prf")
+        for number, path in enumerate(sorted((self.work / "archive").rglob("*.bvh"))):
+            half = self.work / ("half%d" % (number % 2))
+            half.mkdir(exist_ok=True)
+            os.link(path, half / path.name)
         ratios = []
         for _ in range(rounds):
             start = time.monotonic()
-            loops = [subprocess.Popen(["taskset", "-c", str(half), *self.command("loop%d" % half, program=loop,
-                                                                                 sources="half%d" % half)],
-                                      cwd=self.work, stderr=subprocess.DEVNULL) for half in (0, 1)]
+            loops = [subprocess.Popen(["taskset", "-c", str(half), str(self.program.parent / "convert_loop"),
+                                       "half%d" % half, profile, "loop%d" % half],
+                                      cwd=self.work, stdout=subprocess.DEVNULL) for half in (0, 1)]
             for running in loops:
                 running.wait()
             looped = time.monotonic() - start
-            seconds, _, _ = self.run("out", "--jobs", "2")
+            seconds, _, _ = self.run("out", "--jobs", "2", "--profile", profile)
             ratios.append(looped / seconds)
-            print("two loops %.1f s, --jobs 2 %.1f s: %.0f %%" % (looped, seconds, 100 * ratios[-1]))
+            print("two loops %.1f s, --jobs 2 %.1f s: %.0f %%" % (looped, seconds, 100 * ratios[-1]), flush=True)
             for folder in ("loop0", "loop1", "out"):
                 shutil.rmtree(self.work / folder)
         print("speed of --jobs 2 against two loops, median: %.0f %%" % (100 * sorted(ratios)[rounds // 2]))
@@ -115,14 +112,14 @@ def main():
     parser = argparse.ArgumentParser(description=__doc__.splitlines()[0])
     parser.add_argument("bin_folder")
     parser.add_argument("--count", type=int, default=10_000)
-    parser.add_argument("--loop")
+    parser.add_argument("--loop", action="store_true")
     arguments = parser.parse_args()
     work = Path(tempfile.mkdtemp(prefix="gaitwright-many-"))
     try:
         make_archive(work / "archive", arguments.count)
         bench = Bench(arguments.bin_folder, work)
         if arguments.loop:
-            bench.against_loop(Path(arguments.loop).resolve())
+            bench.against_loop()
         else:
             bench.first_and_second(arguments.count)
             bench.equality()
