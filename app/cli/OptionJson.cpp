@@ -89,8 +89,9 @@ bool ReadOptionsJson(std::string_view text, uint64_t bits, COptions& options, st
         return false;
     for (const auto& [name, value] : json.items())
     {
-        const auto row = std::ranges::find_if(
-            OptionTable(), [&](const COptionRow& r) { return (bits & r.bit) && FirstName(r) == name; });
+        const auto row = std::ranges::find_if(OptionTable(), [bits, &name = name](const COptionRow& r) {
+            return (bits & r.bit) && FirstName(r) == name;
+        });
         wrong = name;
         if (row == OptionTable().end() || !std::visit(COptionTaker{value, options}, row->target))
             return false;

@@ -1,20 +1,20 @@
 #include "SmoothCurve.h"
 
 #include <cmath>
-#include <ranges>
 
 namespace gw {
 
 namespace {
 
 // A leaky mean is late by what it smooths; run once in each direction it is not.
-void LeakyMean(auto&& values, double keep, double start)
+template <class TIterator>
+void LeakyMean(TIterator value, TIterator end, double keep)
 {
-    double mean = start;
-    for (float& value : values)
+    double mean = static_cast<double>(*value);
+    for (; value != end; ++value)
     {
-        mean = keep * mean + (1.0 - keep) * static_cast<double>(value);
-        value = static_cast<float>(mean);
+        mean = keep * mean + (1.0 - keep) * static_cast<double>(*value);
+        *value = static_cast<float>(mean);
     }
 }
 
@@ -28,8 +28,8 @@ void SmoothCurve(std::span<float> curve, double frames)
     const double keep = std::exp(-2.0 / frames);
     for (int round = 0; round < 2; ++round)
     {
-        LeakyMean(curve, keep, static_cast<double>(curve.front()));
-        LeakyMean(curve | std::views::reverse, keep, static_cast<double>(curve.back()));
+        LeakyMean(curve.begin(), curve.end(), keep);
+        LeakyMean(curve.rbegin(), curve.rend(), keep);
     }
 }
 
