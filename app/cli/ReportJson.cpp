@@ -10,6 +10,10 @@ namespace gw {
 
 namespace {
 
+// As WriteReports has it. Most records are so; and what the library has parsed takes memory again when it is
+// dropped, and ends the program where there is none.
+constexpr std::string_view kNoReports = R"("failures":[],"warnings":[])";
+
 void WriteReport(CJsonWriter& json, const CReport& report)
 {
     json.BeginObject();
@@ -63,6 +67,8 @@ void WriteRecord(CJsonWriter& json, const std::string& path, const CFailureRecor
 
 bool ReadReports(std::string_view text, std::vector<CReport>& reports)
 {
+    if (text.find(kNoReports) != text.npos)
+        return true;
     const auto json = nlohmann::ordered_json::parse(text, nullptr, false);
     for (const bool warning : {false, true})
     {
