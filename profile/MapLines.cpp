@@ -113,6 +113,9 @@ bool WriteMapLines(const std::string& path, std::span<const CMapLine> lines)
     std::string text;
     for (const CMapLine& line : lines)
         text.append(line.text).append(kLineEnd);
+    // What a first line begins with would be taken for the mark at the begin of a text, and be lost.
+    if (SkipByteOrderMark(text).size() < text.size())
+        text.insert(0, text.substr(0, text.size() - SkipByteOrderMark(text).size()));
     CSafeFile file;
     return file.Open(path) && file.Write(text) && file.Commit();
 }
