@@ -1,6 +1,8 @@
 #include "ConversionJobs.h"
 
+#include "RunSetup.h"
 #include "SourceList.h"
+#include "Words.h"
 
 namespace gw {
 
@@ -11,14 +13,19 @@ constexpr std::string_view kResult = ".Kinetra";
 
 } // namespace
 
-bool ListConversions(const COptions& options, CFileRun::Jobs& jobs)
+EExit ListConversions(const COptions& options, CFileRun::Jobs& jobs)
 {
     std::vector<CSource> sources;
     if (!ListSources(options, kSources, sources))
-        return false;
+        return EExit::Failed;
     for (const CSource& source : sources)
         jobs.push_back({source.path, OutputOf(options.outputFolder, source, kResult)});
-    return true;
+    if (!AreOutputsApart(jobs))
+        return EExit::Usage;
+    if (!jobs.empty())
+        return EExit::Done;
+    SayError("there is no .bvh and no .orn to convert");
+    return EExit::Failed;
 }
 
 } // namespace gw

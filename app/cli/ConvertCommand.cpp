@@ -97,15 +97,8 @@ EExit ConvertMany(const COptions& options)
     CFileRun::Jobs jobs;
     if (!IsManyPossible(options))
         return EExit::Usage;
-    if (!ListConversions(options, jobs))
-        return EExit::Failed;
-    if (!AreOutputsApart(jobs))
-        return EExit::Usage;
-    if (jobs.empty())
-    {
-        SayError("there is no .bvh and no .orn to convert");
-        return EExit::Failed;
-    }
+    if (const EExit listed = ListConversions(options, jobs); listed != EExit::Done)
+        return listed;
     if (!MakeOutputFolder(options) || !HasPageFolder(options)) // which may be the same
         return EExit::Failed;
     return CConversionRun(options, jobs, StateOf(options)).RunAll();

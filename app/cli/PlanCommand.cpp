@@ -100,15 +100,10 @@ EExit RunPlan(const COptions& options)
     CFileRun::Jobs jobs;
     if (!AreShardsRight(options) || !IsRunPossible(options))
         return EExit::Usage;
-    if (!AreSourcesThere(options) || !ListConversions(options, jobs))
+    if (!AreSourcesThere(options))
         return EExit::Failed;
-    if (!AreOutputsApart(jobs))
-        return EExit::Usage;
-    if (jobs.empty())
-    {
-        SayError("there is no .bvh and no .orn to convert");
-        return EExit::Failed;
-    }
+    if (const EExit listed = ListConversions(options, jobs); listed != EExit::Done)
+        return listed;
     CRunPlan plan;
     if (!MayWrite(options, options.output) || !MakePlan(options, jobs, plan))
         return EExit::Failed;

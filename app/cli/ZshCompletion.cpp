@@ -19,7 +19,7 @@ _gaitwright() {
     local -a commands
 )zsh";
 
-// A text within single quotes, in the brackets of a specification.
+// A text within single quotes, in the brackets of a word of _arguments.
 std::string Quoted(std::string_view text)
 {
     std::string quoted;
@@ -56,7 +56,7 @@ std::string Action(const CompletedWord& word)
 }
 
 // "'(-o --output)'{-o,--output}'[the file to write]:OUT:_files'"
-std::string OptionSpecification(const COptionRow& row)
+std::string OptionWord(const COptionRow& row)
 {
     const std::vector<std::string_view> names = Parts(row.names, ",");
     const std::string rest = '[' + Quoted(row.help) + ']' + Action(ValueOf(row)) + '\'';
@@ -65,7 +65,7 @@ std::string OptionSpecification(const COptionRow& row)
     return "'(" + Joined(names, " ") + ")'{" + std::string(row.names) + "}'" + rest;
 }
 
-std::string OperandSpecifications(const CCommand& command)
+std::string OperandWords(const CCommand& command)
 {
     std::string text;
     size_t position = 0;
@@ -82,9 +82,9 @@ std::string CommandCase(const CCommand& command)
 {
     std::string text = "    " + std::string(command.name) + ")\n        _arguments";
     for (const COptionRow& row : OptionTable())
-        text += HasOption(command, row) ? " \\\n            " + OptionSpecification(row) : std::string();
+        text += HasOption(command, row) ? " \\\n            " + OptionWord(row) : std::string();
     return text + " \\\n            '(-h --help)'{-h,--help}'[the help of the command]'" +
-           OperandSpecifications(command) + "\n        ;;\n";
+           OperandWords(command) + "\n        ;;\n";
 }
 
 } // namespace
