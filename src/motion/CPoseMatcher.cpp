@@ -64,6 +64,18 @@ bool IsFaithful(const Mat3& m, int type)
     return std::fabs(m.m[DecompositionOf(type).sineElement]) < 1.0f;
 }
 
+// Whether the rows of a matrix, which have unit length, are perpendicular. Below a bone that takes only a
+// share of a rotation they may not be: scaled quaternions shear its world matrix.
+bool IsOrthogonal(const Mat3& m)
+{
+    constexpr float kPerpendicular = 1e-6f;
+    const auto dot = [&m](int a, int b) {
+        return m.m[a] * m.m[b] + m.m[a + 1] * m.m[b + 1] + m.m[a + 2] * m.m[b + 2];
+    };
+    return std::fabs(dot(0, 3)) < kPerpendicular && std::fabs(dot(0, 6)) < kPerpendicular &&
+           std::fabs(dot(3, 6)) < kPerpendicular;
+}
+
 Mat3 RotationPart(const Mat4& m)
 {
     return {
@@ -224,7 +236,8 @@ void CPoseMatcher::PoseLink(const Chain& chain, const Link& link, const Mat3& ro
         bone.translation = local.Translation();
 
     Mat3 m = NormalizedRows(local);
-    if (!link.whole || !(m_bPlainTurns || IsFaithful(m, link.type)))
+    const bool keepsRotation = link.whole && (m_bPlainTurns || IsFaithful(m, link.type)) && IsOrthogonal(m);
+    if (!keepsRotation)
         m = SharedRotation(m, link.type, link.fraction, link.curve);
     if (link.turned)
         m = link.offset * m;

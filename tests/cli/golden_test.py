@@ -30,9 +30,9 @@ class NumbersTest(CliTest):
 
 @unittest.skipUnless(DATA, "no reference data beside the project")
 class Golden(NumbersTest):
-    def cases(self):
-        for case in json.loads((DATA / "golden" / "cases.json").read_text()):
-            yield case, DATA / "golden" / case["name"]
+    def cases(self, folder="golden"):
+        for case in json.loads((DATA / folder / "cases.json").read_text()):
+            yield case, DATA / folder / case["name"]
 
     def convert(self, case, folder, output):
         legs = [] if case["legs"] else ["--no-legs"]
@@ -49,7 +49,7 @@ class Golden(NumbersTest):
         self.assertLess(angle, DEGREES)
 
     def test_conversions(self):
-        for case, folder in self.cases():
+        for case, folder in [*self.cases(), *self.cases("golden-gaps")]:
             with self.subTest(case["name"]):
                 self.convert(case, folder, "%s.htr" % case["name"])
                 self.assert_same_motion(self.folder / ("%s.htr" % case["name"]), folder / "expected.htr")
