@@ -18,7 +18,9 @@ const float kTwoPi = kPi * 2.0f;
 const float kHalfPi = kPi * 0.5f;
 const float kInversePi = 1.0f / kPi;
 const float kInverseTwoPi = 1.0f / kTwoPi;
-const float kDegreesToRadians = kPi * 0.005555555555555556f;
+// Rounded once: from a rounded pi, the product would be one unit in the last place too large, and angles in
+// files would drift with every load and save.
+const float kDegreesToRadians = static_cast<float>(kDegreesToRadians64);
 const float kRadiansToDegrees = 180.0f / kPi;
 
 double SafeAcos(float x)

@@ -163,6 +163,7 @@ TEST(Angles, TheEndsOfTheArcSineAreTheOtherWayRound)
     }
     EXPECT_GT(SafeAsin(std::nextafter(1.0f, 0.0f)), 1.57);
     EXPECT_EQ(kHalfPi, static_cast<float>(kHalfPi64)); // what the gimbal test compares
+    EXPECT_EQ(kDegreesToRadians, static_cast<float>(kPi64 / 180.0));
 }
 
 TEST(Quat, MatricesComeBackAlsoFromHalfTurns)
