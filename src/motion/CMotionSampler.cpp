@@ -57,7 +57,8 @@ void CMotionSampler::PoseTree(float time)
 
 float TimeOfFrame(int i, float frequency, float frameScale)
 {
-    return static_cast<float>(i) / (frequency * frameScale);
+    // Rounded once, so that the frame position of a whole frame is that frame (CControl::MapTime).
+    return static_cast<float>(i / (static_cast<double>(frequency) * static_cast<double>(frameScale)));
 }
 
 } // namespace gw

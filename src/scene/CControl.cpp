@@ -2,9 +2,30 @@
 
 #include "CFieldArchive.h"
 
+#include <bit>
 #include <cmath>
 
 namespace gw {
+
+namespace {
+
+// From here on, every float is an integer.
+constexpr float kAllWhole = 8388608.0f;
+
+// The integer next to a frame position if they are at most one unit in the last place apart, otherwise the
+// position. A caller reaches frame f at time f / frequency, and the product with the frequency can miss f by
+// that much; without this, one frame in twenty would be a mixture of two keys.
+float WholeFrame(float position)
+{
+    if (!(std::fabs(position) < kAllWhole))
+        return position;
+    const auto nearest = static_cast<float>(static_cast<int32_t>(position + std::copysign(0.5f, position)));
+    // Floats of one sign are in the order of their bits.
+    const int32_t distance = std::bit_cast<int32_t>(position) - std::bit_cast<int32_t>(nearest);
+    return distance == 1 || distance == -1 ? nearest : position;
+}
+
+} // namespace
 
 const CRTTI CControl::ms_kRTTI{"CControl", &CObject::ms_kRTTI};
 const CRTTI CModifier::ms_kRTTI{"CModifier", &CControl::ms_kRTTI};
@@ -67,12 +88,12 @@ float CControl::CycledTime(float s) const
     const float distance = (x - period) * range;
     const bool backward =
         m_iCycleType != static_cast<uint32_t>(ECycleType::Loop) && std::fmod(period, 2.0f) != 0.0f;
-    return backward ? m_fEndTime - distance : distance + m_fBeginTime;
+    return WholeFrame(backward ? m_fEndTime - distance : distance + m_fBeginTime);
 }
 
 float CControl::MapTime(float time) const
 {
-    const float s = time * m_fFrequency + m_fPhase;
+    const float s = WholeFrame(time * m_fFrequency + m_fPhase);
     const float keyTime = std::isnan(s) ? s : CycledTime(s);
     return std::isnan(keyTime) ? m_fBeginTime : keyTime;
 }

@@ -81,6 +81,20 @@ TEST(CControl, MapsTimesByFrequencyPhaseAndCycle)
     }
 }
 
+TEST(CControl, WholeFramesAreWhole)
+{
+    CTestControl control;
+    control.m_fEndTime = 20000.0f;
+    for (const float frequency : {1 / 120.0f, 0.0083333f, 1 / 60.0f, 0.0333333f, 0.04f, 0.06f, 1.0f})
+    {
+        control.m_fFrequency = frequency;
+        for (float frame = 0.0f; frame <= control.m_fEndTime; ++frame)
+            ASSERT_EQ(control.MapTime(frame / frequency), frame) << "at a frequency of " << frequency;
+    }
+    EXPECT_EQ(control.MapTime(7.000002f), 7.000002f) << "four units away";
+    EXPECT_EQ(control.MapTime(6.5f), 6.5f);
+}
+
 TEST(FindKeys, AnyOrderOfPlayFindsTheSameSpan)
 {
     const std::vector<float> times = {0, 1, 2, 4, 8, 16, 32, 33};
