@@ -42,6 +42,7 @@ bool CBVHHierarchyReader::Read()
     m_kFile.root = std::make_unique<TKBVHJoint>();
     m_kFile.root->name = "Global";
     m_kFile.jointCount = 0;
+    m_kFile.nodeCount = 0;
     for (std::string_view rest; m_kLines.Next(rest);)
     {
         const std::string_view keyword = NextToken(rest);
@@ -78,6 +79,7 @@ bool CBVHHierarchyReader::ReadJoint(TKBVHJoint& joint, std::string_view rest, si
         return Fail(EFailure::TooDeep, joint.name);
     if (++m_kFile.jointCount > kBoneLimit)
         return Fail(EFailure::TooLarge, joint.name);
+    m_kFile.nodeCount += joint.MakesNode() ? 1 : 0;
     return ReadBody(joint, depth);
 }
 

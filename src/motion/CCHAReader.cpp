@@ -13,7 +13,7 @@ namespace gw {
 namespace {
 
 constexpr signed char kFirstOfNames = '?'; // in sections, lines that begin with less are remarks
-constexpr size_t kBytesPerRow = 4;         // a name, a blank, a digit and a line feed
+constexpr size_t kBytesPerRow = 2;         // a name and a line feed
 
 struct KeyRow
 {
@@ -87,11 +87,15 @@ bool CCHAReader::ReadWord(std::string_view word, std::string_view rest)
     return key == std::end(kKeys) || ReadKey(word, m_kFile.*key->field, rest);
 }
 
+// A key without a value is as good as a missing one: its field keeps the default.
 bool CCHAReader::ReadKey(std::string_view key, int& field, std::string_view rest)
 {
     const std::string_view token = NextToken(rest);
     if (token.empty())
-        return Fail(EFailure::MissingTokens, key);
+    {
+        Warn(EFailure::MissingTokens, key);
+        return true;
+    }
     if (!ScanInt(token, field))
         return Fail(EFailure::BadNumber, token);
     if (m_kFile.numSegments > kSegmentLimit)
@@ -239,11 +243,12 @@ bool CCHAReader::ReadRow(size_t index, std::string_view line)
     if (!ReadNumbers(line, place.row, count))
         return false;
     const bool counts = index < CountedPlaces().size();
-    if (counts && count == 0)
-        return Fail(EFailure::MissingTokens, name);
     if (counts && count < place.row.size())
         Warn(EFailure::ShortRow, name);
-    place.segment.name = name;
+    // A row without values does not rename its segment: in a file that was cut off, half a name may be the
+    // last thing there is.
+    if (count > 0 || place.rowCount == 0)
+        place.segment.name = name;
     const auto begin = static_cast<size_t>(m_kFile.beginFrame);
     const size_t row = place.rowCount++;
     if (!counts || row < begin || row - begin >= static_cast<size_t>(m_kFile.frameCount))

@@ -18,26 +18,26 @@ namespace {
 
 constexpr std::string_view kEndSection = "[EndOfFile]"; // closes files of other programs
 
-bool TakeValue(std::string_view token, std::string& field)
+bool TakeValue(std::string_view token, TKHTRFile& file, const CHTRText& field)
 {
-    field = token;
+    file.*field.text = token.substr(0, field.size - 1);
     return true;
 }
 
-bool TakeValue(std::string_view token, char& field)
+bool TakeValue(std::string_view token, TKHTRFile& file, char TKHTRFile::*field)
 {
-    field = token[0];
+    file.*field = token[0];
     return true;
 }
 
-bool TakeValue(std::string_view token, int& field)
+bool TakeValue(std::string_view token, TKHTRFile& file, int TKHTRFile::*field)
 {
-    return ScanInt(token, field);
+    return ScanInt(token, file.*field);
 }
 
-bool TakeValue(std::string_view token, float& field)
+bool TakeValue(std::string_view token, TKHTRFile& file, float TKHTRFile::*field)
 {
-    return ScanFloat(token, field) && std::isfinite(field);
+    return ScanFloat(token, file.*field) && std::isfinite(file.*field);
 }
 
 } // namespace
@@ -114,6 +114,7 @@ bool CHTRReader::ReadHeader(std::string_view)
     return true;
 }
 
+// A key without a value is as good as a missing one: its field keeps the default.
 bool CHTRReader::ReadKey(std::string_view key, std::string_view rest)
 {
     const auto known = std::ranges::find(kHTRKeys, key, &CHTRKey::name);
@@ -121,10 +122,13 @@ bool CHTRReader::ReadKey(std::string_view key, std::string_view rest)
         return true;
     const std::string_view token = NextToken(rest);
     if (token.empty())
-        return Fail(EFailure::MissingTokens, key);
+    {
+        Warn(EFailure::MissingTokens, key);
+        return true;
+    }
     if (key == "NumFrames")
         m_uiFramesLine = m_kLines.LineNumber();
-    const auto take = [&](auto field) { return TakeValue(token, m_kFile.*field); };
+    const auto take = [&](const auto& field) { return TakeValue(token, m_kFile, field); };
     return std::visit(take, known->field) || Fail(EFailure::BadNumber, token);
 }
 

@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kBytesPerRow = 4; // a frame number, a value, a blank and a line feed
+constexpr size_t kBytesPerRow = 2; // a frame number and a line feed
 
 bool IsSeparator(char c)
 {
@@ -101,8 +101,8 @@ void CHTRReader::ReserveRows(TKHTRSegment& segment)
     segment.scales.reserve(frames);
 }
 
-// The frame number is passed over: rows count in the order of the file. A short row leaves the others as they
-// were in the row before.
+// The frame number is skipped: rows count in the order of the file. Values that a row does not have, be it
+// all of them, are those of the previous row.
 bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row)
 {
     size_t count = 0;
@@ -110,8 +110,6 @@ bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span
         return Fail(EFailure::BadNumber, NextWord(line));
     if (!ReadNumbers(line, row, count))
         return false;
-    if (count == 0)
-        return Fail(EFailure::MissingTokens, segment.name);
     if (count < row.size())
         Warn(EFailure::ShortRow, segment.name);
     segment.translations.push_back({row[0], row[1], row[2]});

@@ -132,24 +132,24 @@ private:
     std::vector<Row> m_kWaiting; // segment by segment
 };
 
-void Write(CLineWriter& out, const std::string& field)
+void Write(CLineWriter& out, const TKHTRFile& file, const CHTRText& field)
 {
-    out.Text(field);
+    out.Text(file.*field.text);
 }
 
-void Write(CLineWriter& out, char field)
+void Write(CLineWriter& out, const TKHTRFile& file, char TKHTRFile::*field)
 {
-    out.Text({&field, 1});
+    out.Text({&(file.*field), 1});
 }
 
-void Write(CLineWriter& out, int field)
+void Write(CLineWriter& out, const TKHTRFile& file, int TKHTRFile::*field)
 {
-    out.Int(field);
+    out.Int(file.*field);
 }
 
-void Write(CLineWriter& out, float field)
+void Write(CLineWriter& out, const TKHTRFile& file, float TKHTRFile::*field)
 {
-    out.Number(field);
+    out.Number(file.*field);
 }
 
 void WriteVector(CLineWriter& out, const Vec3& v)
@@ -163,7 +163,7 @@ void WriteHeader(CLineWriter& out, const TKHTRFile& file)
     for (const CHTRKey& key : kHTRKeys)
     {
         out.Text(key.name).Text(" ");
-        std::visit([&](auto field) { Write(out, file.*field); }, key.field);
+        std::visit([&](const auto& field) { Write(out, file, field); }, key.field);
         out.EndLine();
     }
 }

@@ -12,13 +12,12 @@ bool MayBeName(std::string_view name)
     return name.size() <= kNameLimit && name.find('\0') == name.npos;
 }
 
-bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes)
+bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes, size_t anySize)
 {
-    // A row takes two bytes a node at the least, so that files of the usual kind stay far below this.
+    // A row usually takes at least two bytes per node, so ordinary files stay far below this.
     constexpr size_t kTimesPerByte = 4;
-    constexpr size_t kAnySize = size_t{1} << 22; // 16 MB, whatever a small file says
     const auto frames = static_cast<size_t>(std::max<int64_t>(frameCount, 0));
-    return frames <= (fileBytes * kTimesPerByte + kAnySize) / std::max<size_t>(nodeCount, 1);
+    return frames <= (fileBytes * kTimesPerByte + anySize) / std::max<size_t>(nodeCount, 1);
 }
 
 CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, const Mat4& restMatrix)

@@ -24,9 +24,11 @@ inline constexpr size_t kNameLimit = 255;
 /// tree and in every file that is written of it.
 bool MayBeName(std::string_view name);
 
-/// Whether that many key times on that many nodes are in proportion to the file that asks for them: a count
-/// of frames is taken at its word, whatever rows follow.
-bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes);
+/// The number of key times, 16 MB of them, that a file of any size may have.
+inline constexpr size_t kKeyTimesOfAnyFile = size_t{1} << 22;
+/// Whether that many key times on that many nodes are in proportion to the file: every node gets a time for
+/// each frame that the header counts, whatever rows follow. Up to `anySize` times fit into any file.
+bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes, size_t anySize = kKeyTimesOfAnyFile);
 
 /// Gives a node a new track without keys: times 0, 1, ... in frames, the frame time in seconds as frequency,
 /// and a rest matrix.

@@ -57,6 +57,7 @@ struct TKBVHFile
     int frameCount = 0;
     float frameTime = 0.0f; ///< seconds
     size_t jointCount = 0;  ///< blocks of all kinds
+    size_t nodeCount = 0;   ///< blocks that make a node
     int64_t rowsAsked = 0;  ///< frames of all motions in the file, of which there should be one
 
     /// The file's root joint, or null.

@@ -17,6 +17,9 @@ namespace gw {
 
 namespace {
 
+// 256 MB of key times. The file holds a row for every frame, but a joint without channels takes no byte of a
+// row and still gets a time for each.
+constexpr size_t kKeyTimesLimit = size_t{1} << 26;
 constexpr float kNoLength = 9.9999997e-07f; // the float of 1e-06, below which an offset has no direction
 
 float SignedBy(float sign, double angle)
@@ -93,8 +96,8 @@ bool TKBVHStream::ReadMotion(TKBVHFile& file)
     CBVHRowReader rows(*root, m_kRecord);
     if (!rows.RowsFit(frameCount, lines.BytesLeft()))
         return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
-    if (!KeyTimesFit(file.rowsAsked, file.jointCount, lines.ByteCount()))
-        return m_kRecord.Fail(EFailure::BadCount, countLine, "Frames:");
+    if (!KeyTimesFit(file.rowsAsked, file.nodeCount, lines.ByteCount(), kKeyTimesLimit))
+        return m_kRecord.Fail(EFailure::TooLarge, countLine, "Frames:");
     if (!rows.ReadRows(lines, frameCount))
         return m_kRecord.Fail(EFailure::TooFewRows, countLine, "Frames:");
     return true;

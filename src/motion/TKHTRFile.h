@@ -57,11 +57,18 @@ struct TKHTRFile
     TKHTRSegment* FirstRoot() const { return root && !root->children.empty() ? root->children[0] : nullptr; }
 };
 
-/// A key of the header and the field that it stands for.
+/// A text field of the header. The format reserves a fixed number of characters for it, one of them for the
+/// terminator; longer values are cut.
+struct CHTRText
+{
+    std::string TKHTRFile::*text;
+    size_t size; ///< with the terminator
+};
+
+/// A key of the header and the field that it fills.
 struct CHTRKey
 {
-    using Field =
-        std::variant<std::string TKHTRFile::*, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
+    using Field = std::variant<CHTRText, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
 
     std::string_view name;
     Field field;
@@ -69,18 +76,18 @@ struct CHTRKey
 
 /// All keys, in the order of writing.
 inline constexpr CHTRKey kHTRKeys[] = {
-    {"FileType",            &TKHTRFile::fileType        },
-    {"DataType",            &TKHTRFile::dataType        },
-    {"FileVersion",         &TKHTRFile::fileVersion     },
-    {"NumSegments",         &TKHTRFile::numSegments     },
-    {"NumFrames",           &TKHTRFile::numFrames       },
-    {"DataFrameRate",       &TKHTRFile::dataFrameRate   },
-    {"EulerRotationOrder",  &TKHTRFile::eulerOrder      },
-    {"CalibrationUnits",    &TKHTRFile::calibrationUnits},
-    {"RotationUnits",       &TKHTRFile::rotationUnits   },
-    {"GlobalAxisofGravity", &TKHTRFile::gravityAxis     },
-    {"BoneLengthAxis",      &TKHTRFile::boneLengthAxis  },
-    {"ScaleFactor",         &TKHTRFile::scaleFactor     },
+    {"FileType",            CHTRText{&TKHTRFile::fileType, 4}        },
+    {"DataType",            CHTRText{&TKHTRFile::dataType, 8}        },
+    {"FileVersion",         &TKHTRFile::fileVersion                  },
+    {"NumSegments",         &TKHTRFile::numSegments                  },
+    {"NumFrames",           &TKHTRFile::numFrames                    },
+    {"DataFrameRate",       &TKHTRFile::dataFrameRate                },
+    {"EulerRotationOrder",  CHTRText{&TKHTRFile::eulerOrder, 4}      },
+    {"CalibrationUnits",    CHTRText{&TKHTRFile::calibrationUnits, 4}},
+    {"RotationUnits",       CHTRText{&TKHTRFile::rotationUnits, 8}   },
+    {"GlobalAxisofGravity", &TKHTRFile::gravityAxis                  },
+    {"BoneLengthAxis",      &TKHTRFile::boneLengthAxis               },
+    {"ScaleFactor",         &TKHTRFile::scaleFactor                  },
 };
 
 } // namespace gw

@@ -202,6 +202,25 @@ TEST(TKBVHStream, ReadsRowsOfAnyLength)
         ASSERT_EQ(nodes[i]->m_kMatrix.Translation().x, static_cast<float>(1000000 + i)) << i;
 }
 
+// Joints without channels and end sites take no place in a row, so the file may be small for its frames.
+TEST(TKBVHStream, ReadsManyFramesOfJointsWithoutChannels)
+{
+    const auto still = [](int frameCount) {
+        std::string text = "HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\n";
+        for (int i = 0; i < 200; ++i)
+            text += "JOINT J\n{\nEnd Site\n{\n}\n}\n";
+        text += "}\nMOTION\nFrames: " + std::to_string(frameCount) + "\nFrame Time: 1\n";
+        for (int i = 0; i < frameCount; ++i)
+            text += "0\n";
+        return text;
+    };
+    const CLoadedMotion file(still(40000), "a.bvh");
+    EXPECT_TRUE(file.loaded) << RecordText(file.motion.Record());
+    EXPECT_EQ(file.motion.GetKeyCount(), 40000);
+    EXPECT_EQ(RecordText(CLoadedMotion(still(400000), "a.bvh").motion.Record()),
+              "failed TooLarge 1207 Frames:\n");
+}
+
 // Values that a short row leaves out move the later ones up, so that keys are one fewer and the last one is
 // filled up.
 TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)

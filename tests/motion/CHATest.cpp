@@ -139,6 +139,12 @@ TEST(TKCHAStream, ReadsOddFilesAsTheyStand)
          "Torso(Head)",                                                                           0,
          "UnknownSegment 23 Hand\nTooFewRows 23 Head\n"                                                                        },
         {{"a header that is not closed", "2\n\n[L", "2\n[L"},                      "Torso(Head)", 0, "OpenHeader 13 [HEADER]\n"},
+        {{"a name alone", "Head 1, 0, 0, 0, 0, 1, 0, -1, 0, 0, 52, 0", "He"},
+         "Torso(Head)",                                                                           3,
+         "ShortRow 23 He\n"                                                                                                    },
+        {{"a key without value", "Number 100", "Number"},
+         "Torso(Head)",                                                                           3,
+         "MissingTokens 2 VersionNumber\n"                                                                                     },
         {{"no frames", "EndFrame 2", "EndFrame -9"},                               "Torso(Head)", 0, ""                        },
     };
     for (const auto& row : rows)
@@ -161,11 +167,12 @@ TEST(TKCHAStream, ShortRowsKeepTheNumbersBefore)
         Change change;
         Vec3 position;
     } rows[] = {
-        {{"no comma before the position", "1, 4, 5, 6", "1 4, 5, 6"}, {1, 2, 3}},
-        {{"a blank before a comma", "1, 4, 5, 6", "1, 4 , 5, 6"},     {4, 2, 3}},
-        {{"a letter behind a number", "1, 4, 5, 6", "1, 4, 5x, 6"},   {4, 5, 3}},
-        {{"two commas", "1, 4, 5, 6", "1, 4,, 6"},                    {4, 2, 3}},
-        {{"the end of the line", "1, 4, 5, 6", "1, 4"},               {4, 2, 3}},
+        {{"no comma before the position", "1, 4, 5, 6", "1 4, 5, 6"},  {1, 2, 3}},
+        {{"a blank before a comma", "1, 4, 5, 6", "1, 4 , 5, 6"},      {4, 2, 3}},
+        {{"a letter behind a number", "1, 4, 5, 6", "1, 4, 5x, 6"},    {4, 5, 3}},
+        {{"two commas", "1, 4, 5, 6", "1, 4,, 6"},                     {4, 2, 3}},
+        {{"the end of the line", "1, 4, 5, 6", "1, 4"},                {4, 2, 3}},
+        {{"a name alone", " 0, 1, 0, -1, 0, 0, 0, 0, 1, 4, 5, 6", ""}, {1, 2, 3}},
     };
     for (const auto& row : rows)
     {
@@ -200,7 +207,6 @@ TEST(TKCHAStream, RefusesWithReasonAndLine)
         {{"no motion", "[MOTION]", "[MOVES]"},                                                                 "MissingSection 23 [MOTION]"                    },
         {{"no root", "Torso Global", "Torso Head"},                                                            "NoRoot 14 Global"                              },
         {{"no count of segments", "NumSegments 2\n", ""},                                                      "NoRoot 13 NumSegments\nBadCount 12 NumSegments"},
-        {{"a key without value", "Rate 25", "Rate"},                                                           "MissingTokens 3 DataFrameRate"                 },
         {{"a word as value", "EndFrame 2", "EndFrame two"},                                                    "BadNumber 5 two"                               },
         {{"a begin before 0", "BeginFrame 0", "BeginFrame -1"},                                                "BadNumber 4 -1"                                },
         {{"101 segments", "ments 2", "ments 101"},                                                             "TooLarge 6 NumSegments"                        },
@@ -211,7 +217,6 @@ TEST(TKCHAStream, RefusesWithReasonAndLine)
         {{"a word in a row", "0, 52, 0", "0, x, 0"},                                                           "BadNumber 23 x"                                },
         {{"no number in a row", "0, 52, 0", "0, nan, 0"},                                                      "BadNumber 23 nan"                              },
         {{"more than any float", "0, 52, 0", "0, 1e39, 0"},                                                    "BadNumber 23 1e39"                             },
-        {{"a name alone", "1, 0, 0, 0, 0, 1, 0, -1, 0, 0, 52, 0", ""},                                         "MissingTokens 23 Head"                         },
         {{"fewer rows", kLastRow, ""},                                                                         "TooFewRows 22 Head"                            },
         {{"a frame more", "EndFrame 2", "EndFrame 3"},                                                         "TooFewRows 23 Torso"                           },
         {{"a segment more", "ments 2", "ments 3"},                                                             "TooFewRows 23 "                                },
