@@ -3,6 +3,7 @@
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CFilePlatform.h"
+#include "CProfileFields.h"
 #include "ProfileFile.h"
 
 #include <algorithm>
@@ -25,11 +26,12 @@ public:
     bool HasFailed() const { return !std::ranges::all_of(m_kReports, &CReport::warning); }
     bool MayConvert() const { return m_bMayConvert; }
 
-    EAnswer ShowMessageBox(int, const std::string& text, EButtons buttons) override
+    EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override
     {
         if (buttons != EButtons::OK)
             return buttons == EButtons::OKCancel ? EAnswer::Cancel : EAnswer::No;
         m_kReports.push_back(Failure({}, "message", text));
+        m_kReports.back().warning = id == kNumberLimitsMessage; // such a number counts all the same
         return EAnswer::OK;
     }
     std::optional<std::string> AskOpenFile(const CFileDialogSetup&) override { return std::nullopt; }

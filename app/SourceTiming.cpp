@@ -2,6 +2,7 @@
 
 #include "CKeyframeControl.h"
 #include "CMotionFile.h"
+#include "CProfileFields.h"
 
 #include <algorithm>
 #include <cmath>
@@ -50,13 +51,18 @@ CKeyframeControl* ConversionTrack(CNode* root)
     return named ? named : PreviewTrack(root);
 }
 
-int ProfileRateOf(CNode* root)
+int SourceRateOf(CNode* root)
 {
     constexpr double kUsual = 30.0;
-    constexpr double kHighest = 240.0; // as the editor takes it
+    constexpr double kBeyond = 1e9; // fits an int
     const CKeyframeControl* track = ConversionTrack(root);
     const double rate = track && track->m_fFrequency > 0.0f ? 1.0 / track->m_fFrequency : kUsual;
-    return static_cast<int>(std::lround(std::clamp(rate, 1.0, kHighest)));
+    return static_cast<int>(std::lround(std::min(rate, kBeyond)));
+}
+
+int ProfileRateOf(CNode* root)
+{
+    return std::clamp(SourceRateOf(root), kLowestFrameRate, kHighestFrameRate);
 }
 
 } // namespace gw

@@ -28,8 +28,10 @@ CKeyframeControl* PreviewTrack(CNode* root);
 /// The track that a container's conversion runs by: an object of a fixed name, else the one of the preview.
 CKeyframeControl* ConversionTrack(CNode* root);
 
-/// The frame rate for a profile made for a source, so that results last as long as it does: whole frames a
-/// second, at most what the editor takes.
+/// The frame rate of a source in whole frames per second, with which a profile's results last as long as the
+/// source does; 30 if the source has no usable rate.
+int SourceRateOf(CNode* root);
+/// The rate for a profile made for a source: its own, or the nearest one that a profile may have.
 int ProfileRateOf(CNode* root);
 
 } // namespace gw

@@ -13,9 +13,6 @@ namespace gw {
 namespace {
 
 constexpr int kOffsetLimit = 10'000;
-constexpr int kLowestFrameRate = 30;
-constexpr int kHighestFrameRate = 240;
-constexpr int kNumberLimitsMessage = 157; // takes the two limits
 
 } // namespace
 

@@ -11,6 +11,12 @@ namespace gw {
 
 class CProfileOwner;
 
+/// The frame rates that the editor accepts. A file may hold others, which count all the same.
+inline constexpr int kLowestFrameRate = 30;
+inline constexpr int kHighestFrameRate = 240;
+/// The message about a number outside its limits, formatted with the two limits.
+inline constexpr int kNumberLimitsMessage = 157;
+
 /// The edit fields of the profile editor, by their control ids.
 enum EProfileField : int
 {

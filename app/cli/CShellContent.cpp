@@ -2,12 +2,14 @@
 
 #include "CContentWindow.h"
 #include "COptions.h"
+#include "CProfileFields.h"
 #include "CReport.h"
 #include "DoubtWords.h"
 #include "Paths.h"
 #include "ProfileChoice.h"
 #include "ProfileFile.h"
 #include "ProfileFit.h"
+#include "StringTable.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -58,6 +60,30 @@ std::vector<CInstalledProfile> ReadInstalled(std::initializer_list<std::pair<std
     return profiles;
 }
 
+// The line of a profile that gives it its frame rate or position, quoted; the last one counts.
+CReport NumberReport(const std::string& path, EProfileLine kind)
+{
+    CReport report;
+    report.warning = true;
+    report.path = path;
+    report.code = "out-of-range";
+    std::string text;
+    ReadProfileText(path, text);
+    CProfileReader reader(text);
+    for (CProfileLine line; reader.Next(line);)
+    {
+        if (line.kind != kind)
+            continue;
+        const auto& [x, y, z] = line.position;
+        report.where = line.line;
+        report.name = kind == EProfileLine::FrameRate
+                          ? "FrameRate " + std::to_string(line.frameRate)
+                          : "Position " + std::to_string(CutToInteger(x)) + ' ' +
+                                std::to_string(CutToInteger(y)) + ' ' + std::to_string(CutToInteger(z));
+    }
+    return report;
+}
+
 } // namespace
 
 EStockPick PickFor(const COptions& options)
@@ -96,6 +122,19 @@ void CShellContent::SelectProfileByName(const std::string& name)
     const std::string path = FindProfilePath(name);
     if (!path.empty())
         UseProfileFile(path);
+}
+
+EAnswer CShellContent::ShowMessage(int id, EButtons buttons, std::span<const int> numbers)
+{
+    if (id != kNumberLimitsMessage)
+        return CGaitConvertContent::ShowMessage(id, buttons, numbers);
+    const bool isRate = numbers.front() == kLowestFrameRate;
+    CReport report =
+        NumberReport(ToldProfilePath(), isRate ? EProfileLine::FrameRate : EProfileLine::Position);
+    const std::string limits[] = {std::to_string(numbers[0]), std::to_string(numbers[1])};
+    report.words = Quoted(report.name) + ": " + FormatText(Message(id), limits);
+    m_kWindow.Report(report);
+    return EAnswer::OK;
 }
 
 void CShellContent::PickStockProfile()

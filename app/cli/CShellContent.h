@@ -64,6 +64,8 @@ public:
 
     /// A profile that was named by its file goes before an installed one of the same name.
     std::string FindProfilePath(const std::string& name) override;
+    /// Reports a number outside its limits with its place in the profile's file.
+    EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
     void RefreshProfileList() override {}
     void SelectProfileByName(const std::string& name) override;
     void PickStockProfile() override;

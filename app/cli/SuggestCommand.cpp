@@ -1,6 +1,7 @@
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CMotionFile.h"
+#include "CReport.h"
 #include "CSafeFile.h"
 #include "CShellContent.h"
 #include "CShellWindow.h"
@@ -185,12 +186,28 @@ bool LoadTarget(const std::string& path, CMotionFile& target)
     return loaded;
 }
 
-// Writes the profile and tells of it, row by row.
-EExit Deliver(const COptions& options, const SuggestedProfile& profile, int frameRate)
+// Results last as long as the source only if the profile has the source's rate.
+void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
+{
+    if (sourceRate == profileRate)
+        return;
+    CReport report = ShellFailure(options.output, "rate",
+                                  "the source has " + std::to_string(sourceRate) +
+                                      " frames per second, and the nearest rate that a profile may have is " +
+                                      std::to_string(profileRate) + ", so results will play " +
+                                      (sourceRate < profileRate ? "faster" : "slower"));
+    report.warning = true;
+    SayReport(options, report);
+}
+
+// Writes the profile and prints its rows.
+EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
 {
     const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
+    const int frameRate = ProfileRateOf(sourceRoot);
     if (!WriteProfile(options.output, ProfileText(name, frameRate, kVec3Zero, profile.Table())))
         return EExit::Failed;
+    WarnOfRate(options, SourceRateOf(sourceRoot), frameRate);
     if (!profile.restIsStance)
         SayWord(options,
                 "the rest pose is none that a body stands in; how bones are turned about themselves was "
@@ -226,7 +243,7 @@ EExit RunSuggest(const COptions& options)
     const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *target.motionRoot);
     if (!profile.missing.empty())
         return FailMissing(options.files[0], profile);
-    return Deliver(options, profile, ProfileRateOf(content.SourceRoot()));
+    return Deliver(options, profile, content.SourceRoot());
 }
 
 } // namespace gw

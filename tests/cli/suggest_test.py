@@ -49,6 +49,15 @@ class Suggest(CliTest):
         for bone in ("LUpperArm", "RForearm", "Neck", "UpperTorso"):
             self.assertLess(bones[bone]["meanError"], 1.0, bone)
 
+    def test_rates_that_a_profile_cannot_have(self):
+        for seconds, rate in (("0.05", 30), ("0.002", 240), ("0.02", 50)):
+            self.write("walk.bvh", re.sub(r"(Frame Time:) .*", rf"\1 {seconds}", WALK.read_text()))
+            told = self.succeed("suggest", "walk.bvh", "-o", "new.prf", "--force")
+            self.assertIn(b"\nFrameRate %d\n" % rate, self.read("new.prf"))
+            self.assertEqual("frames per second" in told.err, rate != 50, seconds)
+            self.assertNotIn("avaliable", self.succeed("convert", "walk.bvh", "-o", "a.htr", "--force",
+                                                      "--profile", "new.prf").err)
+
     def test_what_is_no_body_is_refused_with_what_is_missing(self):
         self.write("small.bvh", BVH)
         result = self.with_assets("suggest", "small.bvh", "-o", "small.prf")
