@@ -63,10 +63,16 @@ private:
     int m_iCount = 0;
 };
 
+// The first node with exactly this name, else the first one that has it in another case.
 CNode* NodeOfName(const std::vector<CNode*>& nodes, std::string_view name)
 {
     const auto has = [=](const CNode* node) { return node->GetName() && node->NameView() == name; };
-    const auto found = std::ranges::find_if(nodes, has);
+    const auto hasAnyCase = [=](const CNode* node) {
+        return node->GetName() && EqualNoCase(node->NameView(), name);
+    };
+    auto found = std::ranges::find_if(nodes, has);
+    if (found == nodes.end())
+        found = std::ranges::find_if(nodes, hasAnyCase);
     return found == nodes.end() ? nullptr : *found;
 }
 

@@ -405,6 +405,7 @@ TEST_F(CRetargeterTest, ShareFileLines)
         {"type stays from the line before",          "Type 2 Waist\nUpperTorso Share 1 5", "UpperTorso", {1, 5, 2}},
         {"the last name wins",                       "Waist Neck Share 6 7 Type 1",        "Neck",       {6, 7, 1}},
         {"a signed number is a name",                "Neck Share -1 2 Type 1",             nullptr,      {}       },
+        {"a name in another case",                   "wAIST Share 3 1 Type 2",             "Waist",      {3, 1, 2}},
         {"a bone that is not there",                 "Tail Share 1 1 Type 1",              nullptr,      {}       },
         {"no numbers",                               "Neck Share Type",                    nullptr,      {}       },
         {"windows line ends",                        "Waist Share 8 9 Type 1\r\n",         "Waist",      {8, 9, 1}},
