@@ -107,6 +107,19 @@ Vec3 CLegPlanter::HintPoint(const LegRecord& leg) const
     return parent ? TransformCoord(point, parent->m_kWorldMatrix) : point;
 }
 
+// The ankle's goal, and the point toward which the knee bends, as seen from the hip in the solver's frame.
+void CLegPlanter::LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const
+{
+    const auto& bones = m_kMatcher.Bones();
+    const Vec3 sourcePelvis = m_pkSourcePelvis->m_kWorldMatrix.Translation();
+    const Vec3 fromHip = bones[Index(m_iTorso)].world.Translation() - bones[leg.thigh].world.Translation();
+    const auto toLimb = [&](const Vec3& point) {
+        return TransformCoord(fromHip + (point - sourcePelvis) * scale, AxisSwapForward);
+    };
+    goal = toLimb(leg.sourceFoot->m_kWorldMatrix.Translation());
+    hint = toLimb(HintPoint(leg));
+}
+
 void CLegPlanter::PlantLeg(size_t k, size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks)
 {
     const LegRecord& leg = m_kLegs[k];
@@ -116,15 +129,11 @@ void CLegPlanter::PlantLeg(size_t k, size_t frame, float scale, const std::vecto
     m_kSolver.SetLimb(k, {0.0f, static_cast<float>(SegmentLength(leg.calf)), 0.0f},
                       {0.0f, static_cast<float>(SegmentLength(leg.foot)), 0.0f}, kVec3UnitZ, kVec3UnitX);
 
-    const Vec3 sourcePelvis = m_pkSourcePelvis->m_kWorldMatrix.Translation();
-    const Vec3 fromHip = bones[Index(m_iTorso)].world.Translation() - thigh.world.Translation();
-    const auto toLimb = [&](const Vec3& point) {
-        return TransformCoord(fromHip + (point - sourcePelvis) * scale, AxisSwapForward);
-    };
+    Vec3 goalPoint;
+    Vec3 hint;
+    LegGoal(leg, scale, goalPoint, hint);
     Mat4 goal = kMat4Identity;
-    goal.SetTranslation(toLimb(leg.sourceFoot->m_kWorldMatrix.Translation()));
-    Vec3 hint = toLimb(HintPoint(leg));
-
+    goal.SetTranslation(goalPoint);
     CLegSolver::Pose pose;
     if (!m_kSolver.Solve(k, hint, goal, pose))
         return;

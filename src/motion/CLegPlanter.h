@@ -42,6 +42,7 @@ private:
     bool Plan(const CRetargeter& retargeter, CNode& targetRoot, const char* thigh, const char* foot);
     void UpdatePath(const LegRecord& leg);
     Vec3 HintPoint(const LegRecord& leg) const;
+    void LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const;
     void PlantLeg(size_t k, size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks);
     double SegmentLength(size_t bone) const;
 

@@ -69,14 +69,14 @@ void CLimbChain::Init(const Mat4& upper, const Mat4& lower, const Vec3& axis, co
     clampReach = true;
 }
 
-void CLimbChain::ClampGoal()
+bool CLimbChain::ClampGoal(const Vec3& a, const Vec3& b, Vec3& goal)
 {
-    const double reach = static_cast<double>(upperLength) + lowerLength;
-    const double distance = Vec3Length(goalPosition);
-    if (distance <= reach)
-        return;
-    goalPosition = goalPosition * static_cast<float>(reach / (distance * kReachSlack));
-    goal.SetTranslation(goalPosition);
+    const double reach = Vec3Length(a) + Vec3Length(b);
+    const double distance = Vec3Length(goal);
+    if (!(distance > reach))
+        return false;
+    goal = goal * static_cast<float>(reach / (distance * kReachSlack));
+    return true;
 }
 
 void CLimbChain::Circle()
@@ -121,8 +121,8 @@ bool CLimbChain::SetGoal(const Mat4& newGoal)
 {
     goal = newGoal;
     goalPosition = goal.Translation();
-    if (clampReach)
-        ClampGoal();
+    if (clampReach && ClampGoal(upperPosition, lowerMatrix.Translation(), goalPosition))
+        goal.SetTranslation(goalPosition);
     Circle();
     if (!SolveKnee())
         return false;

@@ -27,8 +27,11 @@ public:
     bool clampReach = true;
     float kneeAngle = 0.0f;
 
+    /// Draws a goal that lies farther from the origin than the lengths of `a` and `b` together in to just
+    /// short of that. Returns whether it did.
+    static bool ClampGoal(const Vec3& a, const Vec3& b, Vec3& goal);
+
 private:
-    void ClampGoal();
     void Circle();
     bool SolveKnee();
 

@@ -110,6 +110,17 @@ Mat3 OffsetRotation(const Vec3& degrees, const Mat3& matrix)
            AboutAxis(1, degrees.y * kDegreesToRadians) * AboutAxis(2, degrees.z * kDegreesToRadians);
 }
 
+void SetLocalMatrixKeepChildren(CNode& node, const Mat4& local)
+{
+    const Mat4 change = node.m_kMatrix * Mat4InverseOrIdentity(local);
+    for (size_t i = 0; i < node.GetChildCount(); ++i)
+    {
+        if (CSpatial* const child = node.ChildAt(i))
+            child->m_kMatrix = child->m_kMatrix * change;
+    }
+    node.m_kMatrix = local;
+}
+
 CPoseMatcher::CPoseMatcher(const CRetargeter& retargeter, CNode& targetRoot)
     : m_bPlainTurns(retargeter.HasPlainTurns())
 {
@@ -194,19 +205,22 @@ CPoseMatcher::Link CPoseMatcher::PlanLink(const CRetargeter& retargeter, size_t 
     return {index, weights.share1, weights.share2, weights.type, false, offset != kMat3Identity, offset, tip};
 }
 
-void CPoseMatcher::Match()
+void CPoseMatcher::MatchPose()
 {
     for (const Chain& chain : m_kChains)
-        PoseChain(chain);
+    {
+        for (const size_t index : chain.stale)
+            UpdateWorld(index);
+        SpreadRotation(chain, NormalizedRows(*chain.sourceWorld), chain.sourceWorld->Translation(),
+                       RowLengths(*chain.sourceWorld));
+    }
 }
 
-void CPoseMatcher::PoseChain(const Chain& chain)
+// Hands a source bone's world rotation to the bones of a chain, from the top down. The shares were summed up
+// when the chain was planned, so this needs no recursion and no running totals. `position` is by value: each
+// link without a mapped bone above it changes it for those below.
+void CPoseMatcher::SpreadRotation(const Chain& chain, const Mat3& rotation, Vec3 position, const Vec3& scale)
 {
-    for (const size_t index : chain.stale)
-        UpdateWorld(index);
-    const Mat3 rotation = NormalizedRows(*chain.sourceWorld);
-    const Vec3 scale = RowLengths(*chain.sourceWorld);
-    Vec3 position = chain.sourceWorld->Translation();
     for (const Link& link : chain.links)
         PoseLink(chain, link, rotation, scale, position);
 }

@@ -30,8 +30,9 @@ public:
     /// Plans for the trees and tables of a retargeter. Both trees stand in rest pose.
     CPoseMatcher(const CRetargeter& retargeter, CNode& targetRoot);
 
-    /// Turns the target's bones after the source's world matrices.
-    void Match();
+    /// Turns the target's bones after the source's world matrices: each mapped bone takes its source's world
+    /// rotation, and unmapped bones between two mapped ones take their shares of it.
+    void MatchPose();
     /// Writes the bones' local poses into their nodes.
     void WriteNodes() const;
     /// Takes a node's translation back, where something outside has moved it.
@@ -73,7 +74,7 @@ private:
 
     void PlanChain(const CRetargeter& retargeter, size_t bone, CNode& source, std::vector<bool>& visited);
     Link PlanLink(const CRetargeter& retargeter, size_t bone) const;
-    void PoseChain(const Chain& chain);
+    void SpreadRotation(const Chain& chain, const Mat3& rotation, Vec3 position, const Vec3& scale);
     void PoseLink(const Chain& chain, const Link& link, const Mat3& rotation, const Vec3& scale,
                   Vec3& position);
 
@@ -85,5 +86,10 @@ private:
 
 /// What an offset of angles in degrees and a matrix does to a bone's rotation M: the result stands left of M.
 Mat3 OffsetRotation(const Vec3& degrees, const Mat3& matrix);
+
+/// Sets a node's local matrix and changes those of its children by the inverse of the change, so that the
+/// children's world matrices stay. If the new matrix cannot be inverted, the children keep their matrix below
+/// the old one. World matrices follow with the next update.
+void SetLocalMatrixKeepChildren(CNode& node, const Mat4& local);
 
 } // namespace gw

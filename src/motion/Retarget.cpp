@@ -181,7 +181,7 @@ bool CRetargeter::Retarget(float begin, float last, float phase, float frequency
 
     CPoseMatcher matcher(*this, target);
     CFaithfulPose keeper(*this, matcher, m_bFaithful ? &target : nullptr);
-    matcher.Match();
+    matcher.MatchPose();
     matcher.WriteNodes();
     GroundTarget(target, 0.0f);
     matcher.ReadTranslation(0);
@@ -262,7 +262,7 @@ void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframe
     for (size_t frame = 0; frame < frameCount; ++frame)
     {
         sampler.Sample(static_cast<float>(frame) / run.frequency);
-        matcher.Match();
+        matcher.MatchPose();
         bones.front().translation = run.rootPosition + path.Advance(frame == 0 && run.resetOrigin);
         WriteKeys(bones, tracks, frame);
         if (run.useLegs)

@@ -83,6 +83,9 @@ TEST(CLegSolver, ReachesRandomGoalsWithTheKneeTowardTheHint)
 TEST(CLegSolver, GoalsAtTheLimits)
 {
     const float full = kUpper + kLower;
+    Vec3 atReach = {full, 0, 0};
+    EXPECT_FALSE(CLimbChain::ClampGoal({0, kUpper, 0}, {0, 0, kLower}, atReach));
+    EXPECT_EQ(atReach, (Vec3{full, 0, 0}));
     const struct
     {
         const char* what;

@@ -3,6 +3,7 @@
 
 #include "Angles.h"
 #include "CKeyframeControl.h"
+#include "CPoseMatcher.h"
 #include "CRetargeter.h"
 #include "Euler.h"
 #include "Skeleton.h"
@@ -428,6 +429,20 @@ TEST_F(CRetargeterTest, ShareFileLines)
     }
     std::remove(path.c_str());
     EXPECT_FALSE(m_kRetargeter.LoadShares(path));
+}
+
+TEST(CPoseMatcher, ChildrenStayWhenALocalMatrixIsSet)
+{
+    const Ref<CNode> target = MakeTarget();
+    CNode& torso = *FindNode(target.Get(), "UpperTorso");
+    target->UpdateScene(0.0f, true);
+    const Mat4 hand = FindNode(target.Get(), "LHand")->m_kWorldMatrix;
+    const Mat4 local = Mat4Compose(EulerToMat3("ZYX", {10, 20, 30}), {1, 2, 3}, {2, 2, 2});
+    SetLocalMatrixKeepChildren(torso, local);
+    target->UpdateScene(0.0f, true);
+    EXPECT_EQ(torso.m_kMatrix, local);
+    for (int i = 0; i < 16; ++i)
+        EXPECT_NEAR(FindNode(target.Get(), "LHand")->m_kWorldMatrix.m[i], hand.m[i], 1e-3) << i;
 }
 
 } // namespace
