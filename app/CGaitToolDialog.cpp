@@ -244,8 +244,8 @@ void CGaitToolDialog::Convert()
             View(motion)->Stop();
     }
     // A conversion leaves its own rest pose behind, on which the next one must not build.
-    if (m_bConverted)
-        Load(EToolMotion::Result, m_kTargetPath);
+    if (m_bConverted && !Load(EToolMotion::Result, m_kTargetPath))
+        return;
     CRetargeter retargeter;
     retargeter.SetScenes(Root(EToolMotion::Source), Root(EToolMotion::Result));
     const CBoneNames sources(Root(EToolMotion::Source));

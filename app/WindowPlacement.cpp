@@ -2,6 +2,9 @@
 
 #include "Numbers.h"
 
+#include <algorithm>
+#include <charconv>
+
 namespace gw {
 
 namespace {
@@ -13,6 +16,17 @@ constexpr int WindowPlacement::*kNumbers[] = {
     &WindowPlacement::left,       &WindowPlacement::top,         &WindowPlacement::right,
     &WindowPlacement::bottom,
 };
+
+constexpr std::string_view kBlanks = " \t";
+
+// A field holds one integer, with blanks before it or not, and nothing else.
+bool ScanField(std::string_view field, int& number)
+{
+    field.remove_prefix(std::min(field.find_first_not_of(kBlanks), field.size()));
+    const char* const fieldEnd = field.data() + field.size();
+    const auto [end, error] = std::from_chars(field.data(), fieldEnd, number);
+    return error == std::errc() && end == fieldEnd;
+}
 
 } // namespace
 
@@ -35,14 +49,13 @@ bool ScanPlacement(std::string_view text, WindowPlacement& placement)
     WindowPlacement scanned;
     for (const auto number : kNumbers)
     {
-        if (number != kNumbers[0] && !text.starts_with(','))
+        const size_t fieldEnd = std::min(text.find(','), text.size());
+        if (!ScanField(text.substr(0, fieldEnd), scanned.*number))
             return false;
-        if (number != kNumbers[0])
-            text.remove_prefix(1);
-        if (!ScanInt(text, scanned.*number))
-            return false;
-        text.remove_prefix(std::min(text.find(','), text.size()));
+        text.remove_prefix(std::min(fieldEnd + 1, text.size()));
     }
+    if (!text.empty())
+        return false;
     placement = scanned;
     return true;
 }

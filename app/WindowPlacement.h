@@ -24,7 +24,7 @@ struct WindowPlacement
 
 /// Ten numbers with commas between them.
 std::string PlacementText(const WindowPlacement& placement);
-/// False, and the placement left alone, for a text that does not scan into ten numbers.
+/// Returns false and leaves the placement unchanged for a text that is not exactly ten integers.
 bool ScanPlacement(std::string_view text, WindowPlacement& placement);
 
 } // namespace gw

@@ -62,6 +62,11 @@ public:
     void MouseMove(int x, int y, DragKeys keys);
     bool IsDragging() const { return m_bDragging; }
 
+    /// Chooses and sets the format of the surface that the view is drawn on, before there is one. False,
+    /// after saying so, if there is no such format. A view without a surface needs none.
+    virtual bool SetupPixelFormat() { return true; }
+    /// Sets up a new, current GL context for drawing.
+    virtual void InitGL() {}
     /// The lines of the scene as it was evaluated last; valid until the next call.
     virtual const CDrawList& DrawScene();
 

@@ -6,6 +6,7 @@
 #include "Paths.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <regex>
 
 namespace gw {
@@ -449,6 +450,16 @@ TEST_F(ToolTest, AConversionDoesNotDependOnTheOneBefore)
     LoadMap("hip <---> LowerTorso .|lFoot <---> LFoot .|");
     Click(kToolConvert);
     EXPECT_EQ(ResultPoses(), once);
+
+    Write("max.bvh", BvhText(kMaxBones));
+    Click(kToolLoadTarget, "max.bvh");
+    Add("hip", "Bip01");
+    Click(kToolConvert);
+    const std::vector<Mat4> kept = ResultPoses();
+    std::filesystem::remove(m_kFolder.Path("max.bvh"));
+    Click(kToolConvert);
+    EXPECT_EQ(m_kTool.Status().find("max.bvh: "), 0u) << m_kTool.Status();
+    EXPECT_EQ(ResultPoses(), kept);
 }
 
 TEST_F(ToolTest, TransportButtonsMoveTheirOwnViewOnly)

@@ -25,14 +25,19 @@ namespace {
 
 constexpr int kPatience = 5'000; // milliseconds
 constexpr int kLookInterval = 20;
+constexpr int kHumanClick = 120;
+
+Qt::KeyboardModifier ModifierOf(EKey key)
+{
+    return key == EKey::LeftCtrl ? Qt::ControlModifier : Qt::ShiftModifier;
+}
 
 QKeyEvent KeyEvent(QEvent::Type type, EKey key)
 {
     const bool isCtrl = key == EKey::LeftCtrl;
-    const Qt::KeyboardModifiers held = isCtrl ? Qt::ControlModifier : Qt::ShiftModifier;
     return {type,
             isCtrl ? Qt::Key_Control : Qt::Key_Shift,
-            type == QEvent::KeyPress ? held : Qt::NoModifier,
+            type == QEvent::KeyPress ? ModifierOf(key) : Qt::NoModifier,
             0,
             static_cast<quint32>(isCtrl ? 0xffe3 : 0xffe1),
             0};
@@ -107,16 +112,33 @@ void CPerson::Click(const char* name)
     QTest::mouseClick(Child(name), Qt::LeftButton);
 }
 
-void CPerson::PressLeft(EKey key)
+void CPerson::ClickSlowly(const char* name)
 {
-    QKeyEvent event = KeyEvent(QEvent::KeyPress, key);
-    QApplication::sendEvent(m_spFrame.get(), &event);
+    Qt::KeyboardModifiers modifiers;
+    for (const EKey key : m_kHeld)
+        modifiers |= ModifierOf(key);
+    QWidget* const child = Child(name);
+    QTest::mousePress(child, Qt::LeftButton, modifiers);
+    m_spFrame->activateWindow();
+    EXPECT_TRUE(QTest::qWaitForWindowActive(m_spFrame.get()));
+    Wait(kHumanClick);
+    QTest::mouseRelease(child, Qt::LeftButton, modifiers);
 }
 
-void CPerson::ReleaseLeft(EKey key)
+void CPerson::PressLeft(EKey key, QWidget* window)
 {
+    m_kHeld.insert(key);
+    QKeyEvent event = KeyEvent(QEvent::KeyPress, key);
+    if (window)
+        QApplication::sendEvent(window, &event);
+}
+
+void CPerson::ReleaseLeft(EKey key, QWidget* window)
+{
+    m_kHeld.erase(key);
     QKeyEvent event = KeyEvent(QEvent::KeyRelease, key);
-    QApplication::sendEvent(m_spFrame.get(), &event);
+    if (window)
+        QApplication::sendEvent(window, &event);
 }
 
 void CPerson::Type(int key, Qt::KeyboardModifiers modifiers)
@@ -205,6 +227,12 @@ void CPerson::AnswerNext()
         m_kAnswers.erase(m_kAnswers.begin());
         if (answer(*dialog))
             return;
+        if (++m_iWrongLooks * kLookInterval > kPatience)
+        {
+            ADD_FAILURE() << "another window came up than was expected: " << ToUtf8(dialog->windowTitle());
+            dialog->close();
+            return;
+        }
         m_kAnswers.insert(m_kAnswers.begin(), answer);
     }
     QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });

@@ -49,8 +49,12 @@ public:
     QImage Picture(const char* view);
 
     void Click(const char* name);
-    void PressLeft(EKey key);
-    void ReleaseLeft(EKey key);
+    /// Clicks as a person does: the press takes its time and activates the main window, if another one was
+    /// active.
+    void ClickSlowly(const char* name);
+    /// Presses a left key over a window of the program; with null, another program has the keyboard.
+    void PressLeft(EKey key, QWidget* window);
+    void ReleaseLeft(EKey key, QWidget* window);
     void Type(int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void Drop(const std::string& path);
     void ChooseProfile(const QString& name);
@@ -81,10 +85,12 @@ private:
 
     CTempHome m_kHome;
     std::unique_ptr<CFilePlatform> m_spPlatform;
-    CLeftKeys m_kKeys;
+    std::set<EKey> m_kHeld; // on the keyboard, whoever has the focus
+    CLeftKeys m_kKeys{[this] { return m_kHeld; }};
     CSkin m_kSkin;
     std::unique_ptr<CGaitConvertFrame> m_spFrame;
     std::vector<Answer> m_kAnswers;
+    int m_iWrongLooks = 0; // at windows that were not expected
 };
 
 /// The path of an example motion of the project's own.

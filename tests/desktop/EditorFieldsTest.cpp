@@ -238,6 +238,12 @@ TEST_F(EditorPlace, AWindowComesBackToWhereItWas)
     ASSERT_TRUE(ScanPlacement(m_kPlatform.ReadSetting("DialogPos"), placement));
     EXPECT_EQ(placement.left, 123);
     EXPECT_EQ(placement.top, 45);
+    m_kEditor.windowHandle()->setPosition(300, 300); // as a window manager does that places new windows
+    Toggle(true);
+    EXPECT_EQ(m_kEditor.pos(), QPoint(123, 45));
+    m_kEditor.move(200, 70);
+    m_kEditor.SetShown(true);
+    EXPECT_EQ(m_kEditor.pos(), QPoint(200, 70)) << "a visible window stays where it is";
     EXPECT_EQ(OpenAt(placement), QPoint(123, 45));
 }
 

@@ -1,4 +1,5 @@
 #include "CPerson.h"
+#include "CPreviewWidget.h"
 #include "CProfileEditorDialog.h"
 #include "Paths.h"
 #include "QtText.h"
@@ -9,7 +10,9 @@
 #include <QMenu>
 #include <QMouseEvent>
 #include <QSlider>
+#include <QSurfaceFormat>
 #include <QTest>
+#include <QTimer>
 #include <fstream>
 #include <gmock/gmock.h>
 #include <sstream>
@@ -209,13 +212,38 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     CopyTo(folder, "walk.bvh", "a.BVH");
     CopyTo(folder, "walk.bvh", "b.bvh");
     person.ChooseProfile(QStringLiteral("Poser BVH"));
-    person.WillChooseFolder(folder, 1);
-    person.WillAnswer("ok");
-    person.PressLeft(EKey::LeftCtrl);
-    person.Click("open");
-    person.ReleaseLeft(EKey::LeftCtrl);
-    EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("2 BVH files are successful convert to HTR.")});
+    person.Click("%adv");
+    auto* const editor = person.Frame().findChild<QWidget*>(QStringLiteral("profileEditor"));
+    const struct
+    {
+        const char* what;
+        QWidget* pressedOver;
+    } rows[] = {
+        {"over the main window",                    &person.Frame()},
+        {"over the editor, which the click leaves", editor         },
+        {"while another program had the keyboard",  nullptr        },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        QWidget* const active = row.pressedOver ? row.pressedOver : editor;
+        active->activateWindow();
+        ASSERT_TRUE(QTest::qWaitForWindowActive(active));
+        person.m_kBoxes.clear();
+        person.WillChooseFolder(folder, 1);
+        person.WillAnswer("ok");
+        person.PressLeft(EKey::LeftCtrl, row.pressedOver);
+        person.ClickSlowly("open");
+        person.ReleaseLeft(EKey::LeftCtrl, &person.Frame());
+        EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("2 BVH files are successful convert to HTR.")});
+    }
     EXPECT_TRUE(FileExists(folder + "a.htr") && FileExists(folder + "b.htr"));
+
+    // A release that went to another program leaves no key behind.
+    person.PressLeft(EKey::LeftCtrl, &person.Frame());
+    person.ReleaseLeft(EKey::LeftCtrl, nullptr);
+    person.WillChooseFile({});
+    person.ClickSlowly("open");
 
     person.WillChooseFolder(folder, 2);
     person.WillAnswer("ok");
@@ -329,6 +357,25 @@ TEST(MainWindow, StandsWhereItWasClosedUnlessThatIsOffTheScreen)
     person.Frame().move(5000, 5000);
     person.Restart();
     EXPECT_LT(person.Frame().x(), 1280);
+}
+
+TEST(PreviewWidget, SaysThatItsPixelFormatIsMissing)
+{
+    const QSurfaceFormat usual = QSurfaceFormat::defaultFormat();
+    QSurfaceFormat unknown = usual;
+    unknown.setRenderableType(QSurfaceFormat::OpenVG);
+    QSurfaceFormat::setDefaultFormat(unknown);
+    QTimer::singleShot(0, qApp, [] {
+        QWidget* const box = QApplication::activeModalWidget();
+        EXPECT_EQ(box->windowTitle(), QStringLiteral("Error"));
+        EXPECT_EQ(box->findChild<QLabel*>(QStringLiteral("text"))->accessibleName(),
+                  QStringLiteral("ChoosePixelFormat failed"));
+        box->close();
+    });
+    const CLeftKeys keys;
+    CPreviewWidget(keys, nullptr).MakeView();
+    QSurfaceFormat::setDefaultFormat(usual);
+    EXPECT_FALSE(QApplication::activeModalWidget());
 }
 
 TEST(MainWindow, EveryChildHasANameAndFitsItsText)

@@ -68,6 +68,17 @@ class Program(unittest.TestCase):
                 return line
         self.fail("the program said nothing")
 
+    def check_map_tool(self, **more):
+        tool = self.home.start("-s", **more)
+        time.sleep(1)
+        self.assertIsNone(tool.poll())
+        tool.send_signal(signal.SIGTERM)
+        self.assertEqual(tool.wait(PATIENCE), 0)
+
+    def hand(self, *what):
+        """Does something with the screen's own mouse and keyboard, or waits for a window to be there."""
+        return subprocess.run(["xdotool", *what], check=True, timeout=PATIENCE, capture_output=True, text=True).stdout
+
     def wait_for_socket(self):
         self.assertTrue(wait_until(lambda: list(self.home.folder.glob("*TK_KESTRO_GAIT_CONV_1*"))))
 
@@ -80,7 +91,8 @@ class Program(unittest.TestCase):
         self.assertIn("display", errors)
 
     def test_says_what_is_missing_beside_it(self):
-        for missing, words in (("Content/bvh.cnt", "skin"), ("Content/icons/play.svg", "play.svg"), ("base.htr", "base.htr")):
+        for missing, words, ends_with in (("Content/bvh.cnt", "skin", 1), ("Content/icons/play.svg", "play.svg", 1),
+                                          ("base.htr", "base.htr", 0)):
             with self.subTest(missing), tempfile.TemporaryDirectory() as folder:
                 copy = pathlib.Path(folder)
                 shutil.copy(FORGE, copy)
@@ -89,8 +101,9 @@ class Program(unittest.TestCase):
                 (copy / missing).unlink()
                 process = self.home.start(forge=copy / FORGE.name)
                 self.assertIn(words, self.first_line(process))
-                process.kill()
-                self.home.run("--reset-instance-counter")
+                process.send_signal(signal.SIGTERM)  # while the box with these words is open
+                self.assertEqual(process.wait(PATIENCE), ends_with)
+                self.check_map_tool(forge=copy / FORGE.name)  # it needs none of these
 
     def test_stands_without_opengl(self):
         process = self.home.start(ROOT / "examples" / "walk.bvh", QT_QPA_PLATFORM="offscreen")
@@ -127,11 +140,20 @@ class Program(unittest.TestCase):
     def test_the_map_tool_opens_beside_the_main_window(self):
         self.home.start()
         self.wait_for_socket()
-        tool = self.home.start("-s")
-        time.sleep(1)
-        self.assertIsNone(tool.poll())
-        tool.send_signal(signal.SIGTERM)
-        self.assertEqual(tool.wait(PATIENCE), 0)
+        self.check_map_tool()
+
+    def test_a_left_key_that_was_down_before_the_start_counts(self):
+        lines = [line.split() for line in (FORGE.parent / "Content" / "bvh.cnt").read_text().splitlines()]
+        left, top, width, height = next(map(int, line[2:6]) for line in lines if line[:2] == ["button", "open"])
+        self.hand("keydown", "Control_L")
+        self.addCleanup(self.hand, "keyup", "Control_L")
+        self.home.start()
+        window = self.hand("search", "--sync", "--onlyvisible", "--name", "^Gaitwright v2.0$").split()[-1]
+        self.hand("mousemove", "--window", window, str(left + width // 2), str(top + height // 2))
+        self.hand("mousedown", "1")
+        time.sleep(0.12)
+        self.hand("mouseup", "1")
+        self.hand("search", "--sync", "--onlyvisible", "--name", "^Select folder$")
 
 
 if __name__ == "__main__":

@@ -139,7 +139,8 @@ void CProfileEditorWindow::SetShown(bool shown)
         Hide();
         return;
     }
-    RestorePlace();
+    if (!isVisible())
+        RestorePlace();
     Redraw();
     show();
     raise();
@@ -148,6 +149,12 @@ void CProfileEditorWindow::SetShown(bool shown)
 
 void CProfileEditorWindow::RestorePlace()
 {
+    if (m_kHiddenAt)
+    {
+        resize(m_kHiddenAt->size());
+        move(m_kHiddenAt->topLeft());
+        return;
+    }
     if (std::exchange(m_bPlaced, true))
         return;
     resize(kTemplateSize.expandedTo(minimumSizeHint()));
@@ -159,8 +166,10 @@ void CProfileEditorWindow::Hide()
 {
     if (!isVisible())
         return;
-    hide();
+    if (!isMinimized() && !isMaximized())
+        m_kHiddenAt = QRect(pos(), size());
     WriteWindowPlace(m_kPlatform, kPlaceSetting, *this);
+    hide();
 }
 
 void CProfileEditorWindow::reject()

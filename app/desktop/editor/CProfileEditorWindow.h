@@ -3,6 +3,8 @@
 #include "CEditorControls.h"
 
 #include <QDialog>
+#include <QRect>
+#include <optional>
 
 namespace gw {
 
@@ -19,8 +21,8 @@ public:
     CProfileEditorWindow(CGaitConvertContent& content, CPlatform& platform, QWidget* owner);
     ~CProfileEditorWindow() override;
 
-    /// Shows or hides the window as the model says: placement restored at the first showing, stored when it
-    /// is hidden.
+    /// Shows or hides the window as the model says. It is placed from the settings the first time, and later
+    /// comes back where it was hidden; hiding it stores its place.
     void SetShown(bool shown);
     /// The model changed: shows its present state soon, all changes until then at once.
     void Refresh();
@@ -55,6 +57,8 @@ private:
     CGaitConvertContent& m_kContent;
     CPlatform& m_kPlatform;
     CEditorControls m_kControls;
+    std::optional<QRect>
+        m_kHiddenAt; ///< top left with the frame, size without; the window manager forgets it
     bool m_bPlaced = false;
     bool m_bRedrawQueued = false;
     bool m_bLeavingField = false;

@@ -17,6 +17,7 @@
 #include <QApplication>
 #include <QLocale>
 #include <QStyleFactory>
+#include <QTimer>
 #include <cstdio>
 #include <cstdlib>
 
@@ -43,16 +44,12 @@ void Complain(const std::string& words)
     RunMessageBox(nullptr, std::string(BuiltInString(kTitleMessage)), words, EButtons::OK);
 }
 
-bool LoadSkin(CSkin& skin, const CPlatform& platform)
+bool LoadSkin(CSkin& skin, const CPlatform& platform, std::string& problem)
 {
-    std::string problem;
-    if (!skin.Load(platform.DataFolder() + kSkinFolder, problem))
-    {
-        Complain("The window's skin cannot be used. " + problem);
-        return false;
-    }
-    qApp->setStyleSheet(skin.StyleSheet());
-    return true;
+    const bool loaded = skin.Load(platform.DataFolder() + kSkinFolder, problem);
+    if (loaded)
+        qApp->setStyleSheet(skin.StyleSheet());
+    return loaded;
 }
 
 void CheckTarget(const CPlatform& platform)
@@ -88,17 +85,24 @@ private:
 int ShowMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys& keys)
 {
     CSkin skin;
-    if (!LoadSkin(skin, platform))
+    std::string problem;
+    if (!LoadSkin(skin, platform, problem))
+    {
+        Complain("The window's skin cannot be used. " + problem);
         return EXIT_FAILURE;
+    }
     CGaitConvertFrame frame(skin, keys, platform);
     const CInstanceServer server([&frame](const std::string& path) { frame.RaiseAndOpen(path); });
     frame.show();
-    frame.RaiseAndOpen(file);
-    CheckTarget(platform);
+    // In the application's loop: outside it, a request to quit would only close the box and be forgotten.
+    QTimer::singleShot(0, &frame, [&] {
+        frame.RaiseAndOpen(file);
+        CheckTarget(platform);
+    });
     return QApplication::exec();
 }
 
-int RunMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys& keys)
+int InitMain(const std::string& file, CPlatform& platform, const CLeftKeys& keys)
 {
     const CInstanceShare share;
     if (RaiseFirstInstance(file))
@@ -109,10 +113,20 @@ int RunMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys&
     return EXIT_FAILURE;
 }
 
+// The tool borrows the skin's colors, and works without them.
 int RunTool(CPlatform& platform, const CLeftKeys& keys)
 {
     CSkin skin;
-    return LoadSkin(skin, platform) ? RunMapTool(platform, keys) : EXIT_FAILURE;
+    std::string problem;
+    LoadSkin(skin, platform, problem);
+    return RunMapTool(platform, keys);
+}
+
+int InitInstance(const DesktopArguments& arguments)
+{
+    CFilePlatform platform(EPlatformWriting::Yes);
+    const CLeftKeys keys;
+    return arguments.mapTool ? RunTool(platform, keys) : InitMain(arguments.file, platform, keys);
 }
 
 // What needs no screen. None where a window is asked for.
@@ -164,11 +178,7 @@ int RunDesktop(int argc, char** argv)
     QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
     QLocale::setDefault(QLocale::c()); // numbers look and read the same on every desktop
     QuitOnSignals(&application);
-
-    CFilePlatform platform(EPlatformWriting::Yes);
-    const CLeftKeys keys;
-    const DesktopArguments arguments = ReadArguments(QApplication::arguments().mid(1));
-    return arguments.mapTool ? RunTool(platform, keys) : RunMainWindow(arguments.file, platform, keys);
+    return InitInstance(ReadArguments(QApplication::arguments().mid(1)));
 }
 
 } // namespace gw

@@ -2,7 +2,9 @@
 
 #include <QCoreApplication>
 #include <QKeyEvent>
+#include <QMouseEvent>
 #include <optional>
+#include <utility>
 
 namespace gw {
 
@@ -30,26 +32,49 @@ std::optional<EKey> LeftKey(const QKeyEvent& event)
 
 } // namespace
 
-CLeftKeys::CLeftKeys(QObject* parent) : QObject(parent)
+CLeftKeys::CLeftKeys(Query query, QObject* parent) : QObject(parent), m_kQuery(std::move(query))
 {
     QCoreApplication::instance()->installEventFilter(this);
 }
 
+// One window of the program that loses the keyboard to another keeps the keys: a click on an inactive window
+// activates it before the button hears of the click.
 bool CLeftKeys::eventFilter(QObject* watched, QEvent* event)
 {
-    const QEvent::Type type = event->type();
-    if (type == QEvent::ApplicationDeactivate || type == QEvent::WindowDeactivate)
-        m_kDown.clear();
-    if (type != QEvent::KeyPress && type != QEvent::KeyRelease)
-        return QObject::eventFilter(watched, event);
-    if (const auto key = LeftKey(static_cast<const QKeyEvent&>(*event)))
+    switch (event->type())
     {
-        if (type == QEvent::KeyPress)
+    case QEvent::ApplicationDeactivate:
+        m_kDown.clear();
+        break;
+    case QEvent::KeyPress:
+        if (const auto key = LeftKey(static_cast<const QKeyEvent&>(*event)))
             m_kDown.insert(*key);
-        else
+        break;
+    case QEvent::KeyRelease:
+        if (const auto key = LeftKey(static_cast<const QKeyEvent&>(*event)))
             m_kDown.erase(*key);
+        break;
+    case QEvent::MouseButtonPress:
+    case QEvent::MouseButtonRelease: {
+        const Qt::KeyboardModifiers modifiers = static_cast<const QMouseEvent&>(*event).modifiers();
+        Check(EKey::LeftCtrl, modifiers.testFlag(Qt::ControlModifier));
+        Check(EKey::LeftShift, modifiers.testFlag(Qt::ShiftModifier));
+        break;
+    }
+    default:
+        break;
     }
     return QObject::eventFilter(watched, event);
+}
+
+// A click carries the modifiers of its own moment, left or right, even if the program had no focus then. Only
+// a modifier that no left key accounts for needs a question to the system, which takes a round trip.
+void CLeftKeys::Check(EKey key, bool isModified)
+{
+    if (!isModified)
+        m_kDown.erase(key);
+    else if (!IsDown(key) && m_kQuery().contains(key))
+        m_kDown.insert(key);
 }
 
 } // namespace gw

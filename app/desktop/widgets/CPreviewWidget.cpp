@@ -1,11 +1,13 @@
 #include "CPreviewWidget.h"
 
 #include "CLeftKeys.h"
+#include "CMessageBox.h"
 #include "GLPainter.h"
 #include "GLScene.h"
 
 #include <QGuiApplication>
 #include <QMouseEvent>
+#include <QOffscreenSurface>
 #include <QOpenGLContext>
 #include <QPointer>
 #include <QSurfaceFormat>
@@ -30,9 +32,39 @@ public:
             m_kWidget->m_pkView = nullptr;
     }
 
+    bool SetupPixelFormat() override;
+    void InitGL() override { gw::InitGL(); }
+
 private:
     QPointer<CPreviewWidget> m_kWidget;
 };
+
+namespace {
+
+bool FailFormat(QWidget* owner, const char* words)
+{
+    RunMessageBox(owner, "Error", words, EButtons::OK);
+    return false;
+}
+
+} // namespace
+
+// The toolkit makes the widget's context when it shows it, and would end the program if it could not. So a
+// context of the same format is tried first.
+bool CPreviewWidget::CWidgetView::SetupPixelFormat()
+{
+    QOpenGLContext context;
+    if (!context.create())
+        return FailFormat(m_kWidget, "ChoosePixelFormat failed");
+    QOffscreenSurface surface;
+    surface.setFormat(context.format());
+    surface.create();
+    if (!context.makeCurrent(&surface))
+        return FailFormat(m_kWidget, "SetPixelFormat failed");
+    context.doneCurrent();
+    m_kWidget->setFormat(QSurfaceFormat::defaultFormat());
+    return true;
+}
 
 CPreviewWidget::CPreviewWidget(const CLeftKeys& keys, QWidget* parent) : QOpenGLWidget(parent), m_kKeys(keys)
 {
@@ -42,12 +74,15 @@ std::unique_ptr<CGLView> CPreviewWidget::MakeView()
 {
     auto view = std::make_unique<CWidgetView>(this);
     m_pkView = view.get();
+    if (!view->SetupPixelFormat()) // posted, since the application's loop may not run yet
+        QMetaObject::invokeMethod(qApp, &QCoreApplication::quit, Qt::QueuedConnection);
     return view;
 }
 
 void CPreviewWidget::initializeGL()
 {
-    InitGL();
+    CWidgetView empty(nullptr);
+    (m_pkView ? *m_pkView : empty).InitGL();
 }
 
 void CPreviewWidget::resizeGL(int width, int height)
@@ -91,8 +126,7 @@ bool HasOpenGL()
     const auto isScreen = [](const char* name) {
         return QGuiApplication::platformName() == QLatin1String(name);
     };
-    QOpenGLContext context;
-    return std::ranges::none_of(kScreensWithoutViews, isScreen) && context.create();
+    return std::ranges::none_of(kScreensWithoutViews, isScreen) && QOpenGLContext().create();
 }
 
 void RequestPreviewFormat()

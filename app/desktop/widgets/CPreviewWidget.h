@@ -17,7 +17,8 @@ public:
     /// The keys must outlive the widget.
     CPreviewWidget(const CLeftKeys& keys, QWidget* parent);
 
-    /// A new view, drawn here from now on and until it dies. It may outlive the widget.
+    /// A new view, drawn here from now on and until it dies. It may outlive the widget. If the surface cannot
+    /// have the format that a view needs, the user is told and the program asked to quit.
     std::unique_ptr<CGLView> MakeView();
     /// The view that is drawn here, or null.
     CGLView* View() const { return m_pkView; }

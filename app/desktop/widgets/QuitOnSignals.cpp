@@ -1,7 +1,8 @@
 #include "QuitOnSignals.h"
 
-#include <QCoreApplication>
+#include <QApplication>
 #include <QSocketNotifier>
+#include <QWidget>
 
 #ifndef _WIN32
 #include <csignal>
@@ -28,6 +29,17 @@ void Note(int)
     [[maybe_unused]] const ssize_t written = ::write(g_signalPipe[0], &byte, 1);
 }
 
+// A byte that stays would call this again and again. Quitting closes the open dialogs, but does nothing until
+// the application's own loop runs; until then, a dialog has a loop of its own.
+void Quit()
+{
+    char byte = 0;
+    [[maybe_unused]] const ssize_t count = ::read(g_signalPipe[1], &byte, 1);
+    QCoreApplication::quit();
+    if (QWidget* const dialog = QApplication::activeModalWidget())
+        dialog->close();
+}
+
 } // namespace
 
 void QuitOnSignals(QObject* parent)
@@ -35,7 +47,7 @@ void QuitOnSignals(QObject* parent)
     if (::socketpair(AF_UNIX, SOCK_STREAM | SOCK_CLOEXEC, 0, g_signalPipe) != 0)
         return;
     auto* const notifier = new QSocketNotifier(g_signalPipe[1], QSocketNotifier::Read, parent);
-    QObject::connect(notifier, &QSocketNotifier::activated, parent, [] { QCoreApplication::quit(); });
+    QObject::connect(notifier, &QSocketNotifier::activated, parent, Quit);
     for (const int number : {SIGTERM, SIGINT, SIGHUP})
         std::signal(number, Note);
 }
