@@ -48,6 +48,7 @@ public:
     /// What a view shows.
     QImage Picture(const char* view);
 
+    void Activate(QWidget& window);
     void Click(const char* name);
     /// Clicks as a person does: the press takes its time and activates the main window, if another one was
     /// active.

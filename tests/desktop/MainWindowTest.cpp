@@ -214,6 +214,7 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     person.ChooseProfile(QStringLiteral("Poser BVH"));
     person.Click("%adv");
     auto* const editor = person.Frame().findChild<QWidget*>(QStringLiteral("profileEditor"));
+    person.Activate(*editor);
     const struct
     {
         const char* what;
@@ -226,9 +227,7 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.what);
-        QWidget* const active = row.pressedOver ? row.pressedOver : editor;
-        active->activateWindow();
-        ASSERT_TRUE(QTest::qWaitForWindowActive(active));
+        person.Activate(row.pressedOver ? *row.pressedOver : *editor);
         person.m_kBoxes.clear();
         person.WillChooseFolder(folder, 1);
         person.WillAnswer("ok");

@@ -142,9 +142,11 @@ class Program(unittest.TestCase):
         self.wait_for_socket()
         self.check_map_tool()
 
-    def test_a_left_key_that_was_down_before_the_start_counts(self):
+    def test_a_left_key_that_was_pressed_over_another_program_counts(self):
         lines = [line.split() for line in (FORGE.parent / "Content" / "bvh.cnt").read_text().splitlines()]
         left, top, width, height = next(map(int, line[2:6]) for line in lines if line[:2] == ["button", "open"])
+        self.home.start("-s")
+        self.hand("search", "--sync", "--onlyvisible", "--name", "^GaitTool$")
         self.hand("keydown", "Control_L")
         self.addCleanup(self.hand, "keyup", "Control_L")
         self.home.start()
