@@ -165,7 +165,7 @@ TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
 
     person.WillAnswer("cancel");
     person.Click("exit");
-    person.Wait(60);
+    EXPECT_TRUE(person.WaitUntil([&] { return person.m_kBoxes.size() == 2; }));
     EXPECT_TRUE(person.Frame().isVisible());
 
     person.WillAnswer("no");
