@@ -329,6 +329,8 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
         EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), row.whole);
         EXPECT_EQ(loaded.GetRootCount(), row.whole ? 1u : 0u);
         EXPECT_TRUE(loaded.Thumbnail().m_kPixels.empty());
+        EXPECT_TRUE(loaded.LoadThumbnailOnly(bytes.Bytes(), 0));
+        EXPECT_EQ(loaded.Thumbnail().m_kPixels.size(), 16u) << "after a failure too";
     }
 }
 
