@@ -232,17 +232,19 @@ TEST(HTMLText, NamesAreNoMarkupAndNoScript)
         std::string_view page;
         std::string_view script;
     } rows[] = {
-        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"     },
-        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\\"'"   },
-        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\\\\\\"b\\r\\n"},
+        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"              },
+        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\x22'"           },
+        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\x5c\\x22b\\x0d\\x0a"   },
+        {"control bytes",                         "\x1b\x7f",               "\x1b&#127;",              "\\x1b\\x7f"               },
         {"two, three and four bytes of UTF-8",    "\u00fc\u6771\U0001f9b4", "&#252;&#26481;&#129460;",
-         "\\u{fc}\\u{6771}\\u{1f9b4}"                                                                                    },
-        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\xa5\x5c\\\""    },
-        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\x81\\\\\\\""    },
-        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\xa5\\x3c"       },
-        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\xc0\xbc"        },
-        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\xed\xa0\x80"    },
-        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\u6771\xe6\x9d"  },
+         "\\xfc\\u{6771}\\u{1f9b4}"                                                                                               },
+        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\\u{529f}\\x22"           },
+        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\\x81\\x5c\\x22"          },
+        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\\xa5\\x3c"               },
+        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\\u{64d8}"                },
+        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\\xed\\xa0\\x80"          },
+        {"beyond the last character",             "\xf4\x90\x80\x80",       "\xf4\x90\x80\x80",        "\\xf4\\x90\\x80\\x80"     },
+        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\\xe6\\x9d\\xb1\\xe6\\x9d"},
     };
     for (const auto& row : rows)
     {
