@@ -14,6 +14,10 @@
 #include <cfloat>
 #include <filesystem>
 #include <limits>
+#include <set>
+#include <tuple>
+
+#include <sys/stat.h>
 
 namespace gw {
 namespace {
@@ -205,7 +209,12 @@ TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
     EXPECT_THAT(PageOf(*root), HasSubstr("root"));
 
     COrnHTMLPage page;
-    EXPECT_FALSE(page.SaveAs(m_kFolder.Path("Index.htm")));
+    WriteBytes(m_kFolder.Path("elsewhere"), "kept");
+    std::filesystem::create_symlink("elsewhere", m_kFolder.Path("link.htm"));
+    ASSERT_EQ(mkfifo(m_kFolder.Path("pipe.htm").c_str(), 0600), 0);
+    for (const char* name : {"Index.htm", "link.htm", "pipe.htm"}) // the last would wait for a reader
+        EXPECT_FALSE(page.SaveAs(m_kFolder.Path(name))) << name;
+    EXPECT_EQ(Page("elsewhere"), "kept");
     EXPECT_TRUE(page.SaveAsText(m_kFolder.Path("page.htm").c_str()));
     root->WriteHTMLFrames(m_kFolder.Path("no folder/"));
     EXPECT_FALSE(FolderExists(m_kFolder.Path("no folder")));
