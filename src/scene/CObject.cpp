@@ -194,7 +194,7 @@ void CObject::Save(COrrinStream& stream)
 
 void CObject::DumpHTML(const std::string& folder, COrnHTMLWriter& page)
 {
-    CHTMLDump(folder).Fill(page, *this);
+    CHTMLDump::AddObject(folder, page, *this);
 }
 
 void CObject::DumpTable(CHTMLTables& tables)

@@ -1,5 +1,6 @@
 #include "CCamera.h"
 #include "CCustomData.h"
+#include "CHTMLDump.h"
 #include "CLight.h"
 #include "COrnHTMLPage.h"
 #include "HTMLMarkup.h"
@@ -159,7 +160,7 @@ TEST_F(HTMLDump, CustomDataHasNoTableAndAnObjectThatIsNoNodeNoSite)
     EXPECT_EQ(Page("data.htm"), "");
 }
 
-TEST_F(HTMLDump, SharedObjectsHaveOnePageAndRingsComeToAnEnd)
+TEST_F(HTMLDump, SharedObjectsHaveOnePageAndAnEntryAtEachPlace)
 {
     const Ref<CNode> root = Node("root");
     const Ref<CNode> shared = Node("shared");
@@ -167,13 +168,58 @@ TEST_F(HTMLDump, SharedObjectsHaveOnePageAndRingsComeToAnEnd)
     for (CNode* child : {shared.Get(), other.Get(), shared.Get()})
         root->AttachChild(child);
     other->AttachChild(shared.Get());
-    shared->AttachChild(root.Get());
-    root->WriteHTMLFrames(m_kFolder.Path());
-    EXPECT_EQ(FileCount(), 5u);
-    const std::string tree = Page("TreeView.htm");
-    const std::string entry = "gFld(\"shared\"";
-    EXPECT_EQ(tree.find(entry), tree.rfind(entry)) << "at the first of its places";
+    shared->AttachChild(root.Get()); // a ring
+    CHTMLDump dump(m_kFolder.Path());
+    dump.WriteSite(*root);
+    dump.WriteSite(*other);
+    EXPECT_EQ(FileCount(), 7u);
+    const auto script = [&](const CNode& top,
+                            const std::vector<std::pair<const CNode*, const CNode*>>& below) {
+        const auto folder = [](const CNode& node) {
+            return "gFld(\"" + std::string(node.NameView()) + "\", \"OrnHTML" + ID(node) +
+                   ".htm target=mainFrame\")";
+        };
+        std::set<const CNode*> named{&top};
+        std::string text = "<!--\nNode" + ID(top) + " = " + folder(top) + ";\n";
+        for (const auto& [parent, node] : below)
+            text += (named.insert(node).second ? "Node" + ID(*node) + " = " : "") + "insFld(Node" +
+                    ID(*parent) + ", " + folder(*node) + ");\n";
+        return text + "initializeDocument(Node" + ID(top) + ")\n-->";
+    };
+    const auto [r, s, o] = std::tuple(root.Get(), shared.Get(), other.Get());
+    EXPECT_THAT(Page("TreeView.htm"), HasSubstr(script(*r, {
+                                                               {r, s},
+                                                               {r, o},
+                                                               {r, s},
+                                                               {s, r},
+                                                               {o, s}
+    })));
+    EXPECT_THAT(Page("TreeView2.htm"), HasSubstr(script(*o, {
+                                                                {o, s},
+                                                                {s, r},
+                                                                {r, s},
+                                                                {r, o},
+                                                                {r, s}
+    })));
     shared->DetachChild(root.Get());
+}
+
+TEST_F(HTMLDump, TreesOfManyRootsStayWithinALimit)
+{
+    constexpr size_t kWidth = 1200; // squared, more than the limit
+    const Ref<CNode> shared = Node("shared");
+    std::vector<Ref<CNode>> roots(kWidth);
+    for (auto& root : roots)
+    {
+        shared->AttachChild(new CNode);
+        root = Node("root");
+        root->AttachChild(shared.Get());
+    }
+    CHTMLDump dump(m_kFolder.Path("no folder/")); // counting its pages is enough
+    for (const auto& root : roots)
+        dump.WriteSite(*root);
+    EXPECT_EQ(dump.PageCount(), 4 * kWidth + 1);
+    EXPECT_LT(dump.EntryCount(), CHTMLDump::kEntryLimit + 3 * kWidth);
 }
 
 TEST_F(HTMLDump, NoTreeIsTooDeep)
@@ -186,13 +232,38 @@ TEST_F(HTMLDump, NoTreeIsTooDeep)
         nodes.push_back(new CNode);
         nodes[nodes.size() - 2]->AttachChild(nodes.back().Get());
     }
-    root->WriteHTMLFrames(m_kFolder.Path());
-    EXPECT_EQ(FileCount(), kLevels + 3u);
+    CHTMLDump dump(m_kFolder.Path("no folder/"));
+    dump.WriteSite(*root);
+    EXPECT_EQ(dump.PageCount(), kLevels + 3u);
     while (nodes.size() > 1) // from below, so that they do not die one within the other
     {
         nodes[nodes.size() - 2]->DetachChild(nodes.back().Get());
         nodes.pop_back();
     }
+}
+
+TEST_F(HTMLDump, AClassMayAddToItsOwnPage)
+{
+    class COwnPage : public CNode
+    {
+    public:
+        void DumpHTML(const std::string& folder, COrnHTMLWriter& page) override
+        {
+            CNode::DumpHTML(folder, page);
+            page.AddLine("own line");
+        }
+    };
+    const Ref<CNode> root = Node("root");
+    const Ref<CNode> child = new COwnPage;
+    child->AttachChild(Node("grandchild").Get());
+    root->AttachChild(child.Get());
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_THAT(PageOf(*child), testing::EndsWith("</CAPTION></TABLE>\nown line\n"));
+    EXPECT_EQ(FileCount(), 5u);
+    COrnHTMLWriter page;
+    child->DumpHTML(m_kFolder.Path("no folder/"), page);
+    ASSERT_TRUE(page.SaveAs(m_kFolder.Path("page.htm")));
+    EXPECT_EQ(kHTMLCodePage + ("\n" + Page("page.htm")), PageOf(*child));
 }
 
 TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
