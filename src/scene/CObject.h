@@ -111,7 +111,8 @@ public:
     /// Appends a control, with the chain behind it, to the control chain and targets it here. False for null
     /// and for a control that has a target already.
     bool AttachControl(CControl* control);
-    /// The same for the modifier chain, whose end is the first object that is no modifier.
+    /// Does the same for the modifier chain, which ends at the first object that is not a modifier. False,
+    /// with nothing changed, also if the head itself is not a modifier.
     bool AttachModifier(CControl* modifier);
     /// Makes a custom data object the head of its chain. With a head there already the end is looked for in
     /// the control chain, as it has always been, and where that is no custom data nothing changes: false.
