@@ -1,5 +1,5 @@
 #include "CHTMLDump.h"
-#include "CSafeFile.h"
+#include "COrnHTMLPage.h"
 #include "CSceneFile.h"
 #include "Commands.h"
 #include "Output.h"
@@ -20,8 +20,11 @@ EExit Fail(const std::string& path, const std::string& words)
 
 bool WriteTreeView(const std::string& folder)
 {
-    CSafeFile file;
-    return file.Open(folder + "TreeView.js") && file.Write(kTreeViewScript) && file.Commit();
+    COrnHTMLPage script;
+    std::string text(kTreeViewScript);
+    text.pop_back(); // each line of a page gets its line feed when it is written
+    script.AddLine(std::move(text));
+    return script.SaveAs(folder + "TreeView.js");
 }
 
 } // namespace

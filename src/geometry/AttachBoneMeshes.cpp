@@ -16,10 +16,19 @@ float OffsetLength(const CNode& node)
     return static_cast<float>(Vec3Length(node.m_kMatrix.Translation()));
 }
 
+// Slots that hold a child: attaching children leaves spare ones.
+size_t HeldChildCount(const CNode& node)
+{
+    size_t count = 0;
+    for (size_t slot = 0; slot < node.GetChildCount(); ++slot)
+        count += node.ChildAt(slot) ? 1 : 0;
+    return count;
+}
+
 void AttachBoneMesh(CNode& node)
 {
     Ref<CBoneMesh> mesh;
-    if (node.GetChildCount() > 1)
+    if (HeldChildCount(node) > 1)
         mesh = new CBoneNodeMesh;
     else
         mesh = new CBoneShapeMesh;

@@ -150,9 +150,10 @@ bool BuildShape(CBoneMesh& mesh, float length, std::span<const Vec3> points,
 {
     if (!(length > 0.0f))
         return false;
+    if (!mesh.SetPointCount(static_cast<int32_t>(points.size())) ||
+        !mesh.SetTriangleQuantity(static_cast<int32_t>(triangles.size())))
+        return false;
     mesh.m_fLength = length;
-    mesh.SetPointCount(static_cast<int32_t>(points.size()));
-    mesh.SetTriangleQuantity(static_cast<int32_t>(triangles.size()));
     std::ranges::transform(points, mesh.XYZBuffer().begin(),
                            [=](const Vec3& point) { return point * length; });
     auto index = mesh.XYZTriIndexBuffer().begin();

@@ -19,27 +19,35 @@ void AddScaled(Mat4& sum, const Mat4& matrix, float weight)
         sum.m[i] += weight * matrix.m[i];
 }
 
-// A point that no bone moves goes with the mesh, and so does what its weights lack.
-Mat4 Blend(std::span<const CSkinPointRecord> influences, std::span<const Mat4> matrices, const Mat4& world)
+// What the weights lack up to 1 goes to the mesh's own matrix.
+Mat4 Blend(const CSkinPointRecord& point, std::span<const Mat4> matrices, const Mat4& world)
 {
-    if (influences.empty())
-        return world;
     Mat4 blend = kMat4Zero;
     float sum = 0.0f;
-    for (const CSkinPointRecord& influence : influences)
+    for (size_t i = 0; i < point.places.size(); ++i)
     {
-        sum += influence.weight;
-        AddScaled(blend, matrices[influence.bone], influence.weight);
+        sum += point.weights[i];
+        AddScaled(blend, matrices[point.places[i]], point.weights[i]);
     }
     if (!(sum >= 1.0f))
         AddScaled(blend, world, 1.0f - sum);
     return blend;
 }
 
+void MovePoints(std::span<const CSkinPointRecord> records, std::span<const Mat4> matrices, const Mat4& world,
+                std::span<Vec3> points)
+{
+    for (const CSkinPointRecord& record : records)
+        points[record.point] = TransformCoord(points[record.point], Blend(record, matrices, world));
+}
+
 } // namespace
 
 CBoneSkinControl::CBoneSkinControl() = default;
-CBoneSkinControl::CBoneSkinControl(const CBoneSkinControl& source) = default;
+CBoneSkinControl::CBoneSkinControl(const CBoneSkinControl& source)
+    : CControl(source), m_kBones(source.m_kBones)
+{
+}
 CBoneSkinControl::~CBoneSkinControl() = default;
 
 CObject* CBoneSkinControl::CreateClone() const
@@ -68,7 +76,11 @@ void CBoneSkinControl::Link(COrrinStream& stream, CLinkRecord& record)
 
 uint64_t CBoneSkinControl::GetMemoryUsed() const
 {
-    uint64_t bytes = CControl::GetMemoryUsed() + 36 + m_kPoints.size() * sizeof(CSkinPointRecord);
+    constexpr size_t kInfluenceBytes = sizeof(CSpatial*) + sizeof(float) + sizeof(uint32_t);
+    uint64_t bytes = CControl::GetMemoryUsed() + 36 + m_kPoints.size() * sizeof(CSkinPointRecord) +
+                     m_kPointBones.size() * kInfluenceBytes;
+    for (const auto& row : m_kGroups)
+        bytes += row.size() * sizeof(CSkinPointRun);
     for (const CSkinBoneRecord& record : m_kBones)
         bytes += 80 + record.m_kInfluences.size() * sizeof(CSkinInfluence);
     return bytes;
@@ -92,27 +104,87 @@ void CBoneSkinControl::AddInfluence(CSpatial& bone, uint32_t point, float weight
     influences.insert(influences.begin(), {point, weight});
 }
 
-uint32_t CBoneSkinControl::LiveBones() const
+std::vector<CSpatial*> CBoneSkinControl::CurrentBones() const
 {
-    const auto isLive = [](const CSkinBoneRecord& record) { return static_cast<bool>(record.m_pkBone); };
-    return static_cast<uint32_t>(std::ranges::count_if(m_kBones, isLive));
+    std::vector<CSpatial*> bones(m_kBones.size());
+    std::ranges::transform(m_kBones, bones.begin(),
+                           [](const CSkinBoneRecord& record) { return record.m_pkBone.Get(); });
+    return bones;
+}
+
+// Those that act, by point, and for one point in the order of the bones.
+std::vector<CBoneSkinControl::Influence> CBoneSkinControl::SortedInfluences() const
+{
+    std::vector<Influence> influences;
+    for (uint32_t place = 0; place < m_kBones.size(); ++place)
+    {
+        if (!m_kTableBones[place])
+            continue;
+        for (const CSkinInfluence& influence : m_kBones[place].m_kInfluences)
+        {
+            if (influence.SkinWeight != 0.0f && influence.SkinID < m_uiTablePoints)
+                influences.push_back({influence.SkinID, place, influence.SkinWeight});
+        }
+    }
+    std::ranges::stable_sort(influences, {}, &Influence::point);
+    return influences;
+}
+
+void CBoneSkinControl::AddToGroup(size_t influences, uint32_t begin, uint32_t end)
+{
+    if (begin == end)
+        return;
+    m_kGroups.resize(std::max(m_kGroups.size(), influences + 1));
+    std::vector<CSkinPointRun>& row = m_kGroups[influences];
+    if (!row.empty() && row.back().end == begin)
+        row.back().end = end;
+    else
+        row.push_back({begin, end, m_kPoints.size()});
 }
 
 void CBoneSkinControl::RebuildSkinTables()
 {
-    m_kPoints.clear();
-    for (uint32_t bone = 0; bone < m_kBones.size(); ++bone)
+    CGeometry* target = RecordCast<CGeometry>(GetTarget());
+    m_uiTablePoints = target ? target->WorldXYZBuffer().size() : 0;
+    m_kTableBones = CurrentBones();
+    const std::vector<Influence> influences = SortedInfluences();
+    m_kPointBones.resize(influences.size());
+    m_kPointWeights.resize(influences.size());
+    m_kPointPlaces.resize(influences.size());
+    for (size_t i = 0; i < influences.size(); ++i)
     {
-        if (!m_kBones[bone].m_pkBone)
-            continue;
-        for (const CSkinInfluence& influence : m_kBones[bone].m_kInfluences)
-        {
-            if (influence.SkinWeight != 0.0f)
-                m_kPoints.push_back({influence.SkinID, bone, influence.SkinWeight});
-        }
+        m_kPointBones[i] = m_kTableBones[influences[i].place];
+        m_kPointWeights[i] = influences[i].weight;
+        m_kPointPlaces[i] = influences[i].place;
     }
-    std::ranges::stable_sort(m_kPoints, {}, &CSkinPointRecord::point);
-    m_uiLiveBones = LiveBones();
+
+    m_kPoints.clear();
+    m_kGroups.assign(1, {});
+    uint32_t next = 0; // the first point that is in no group yet
+    for (size_t first = 0; first < influences.size();)
+    {
+        const uint32_t point = influences[first].point;
+        size_t count = 1;
+        while (first + count < influences.size() && influences[first + count].point == point)
+            ++count;
+        AddToGroup(0, next, point);
+        AddToGroup(count, point, point + 1);
+        next = point + 1;
+        m_kPoints.push_back({point, std::span(m_kPointBones).subspan(first, count),
+                             std::span(m_kPointWeights).subspan(first, count),
+                             std::span(m_kPointPlaces).subspan(first, count)});
+        first += count;
+    }
+    AddToGroup(0, next, static_cast<uint32_t>(m_uiTablePoints));
+}
+
+bool CBoneSkinControl::AreTablesCurrent(size_t pointCount) const
+{
+    const auto isSame = [](const CSkinBoneRecord& record, const CSpatial* bone) {
+        return record.m_pkBone.Get() == bone;
+    };
+    return !m_kGroups.empty() && pointCount == m_uiTablePoints &&
+           std::ranges::equal(m_kBones, m_kTableBones, isSame);
 }
 
 bool CBoneSkinControl::Bind(CObject& root)
@@ -153,32 +225,28 @@ std::vector<Mat4> CBoneSkinControl::SkinMatrices(const Mat4& before) const
     return matrices;
 }
 
-// Those of one point, from `next` on, which then stands behind them.
-std::span<const CSkinPointRecord> CBoneSkinControl::TakeInfluences(size_t& next, uint32_t point) const
-{
-    const size_t first = next;
-    while (next < m_kPoints.size() && m_kPoints[next].point == point)
-        ++next;
-    return std::span(m_kPoints).subspan(first, next - first);
-}
-
 bool CBoneSkinControl::Update(float)
 {
     CGeometry* target = RecordCast<CGeometry>(GetTarget());
     if (!m_bActive || !target)
         return false;
-    if (LiveBones() != m_uiLiveBones)
+    const std::span<Vec3> points = target->WorldXYZBuffer();
+    if (!AreTablesCurrent(points.size()))
         RebuildSkinTables();
     const Mat4& world = target->m_kWorldMatrix;
     // Behind a control that has already put the points into the world they first go back to the model.
     const std::vector<Mat4> matrices =
         SkinMatrices(target->m_bWorldValid ? Mat4InverseOrIdentity(world) : kMat4Identity);
-    const std::span<Vec3> points = target->WorldXYZBuffer();
-    size_t next = 0;
-    for (uint32_t point = 0; point < points.size(); ++point)
+    for (const CSkinPointRun& run : m_kGroups.front())
     {
-        const auto influences = TakeInfluences(next, point);
-        points[point] = TransformCoord(points[point], Blend(influences, matrices, world));
+        for (uint32_t point = run.begin; point < run.end; ++point)
+            points[point] = TransformCoord(points[point], world);
+    }
+    for (size_t group = 1; group < m_kGroups.size(); ++group)
+    {
+        for (const CSkinPointRun& run : m_kGroups[group])
+            MovePoints(std::span(m_kPoints).subspan(run.record, run.end - run.begin), matrices, world,
+                       points);
     }
     target->m_bWorldValid = true;
     ++target->m_uiChangeStamp;

@@ -25,12 +25,23 @@ struct CSkinBoneRecord
     std::vector<CSkinInfluence> m_kInfluences;
 };
 
-/// An influence that acts, as an update walks them: by point, for one point in the order of the bones.
+/// What moves one point: its bones, in the order of the bone table, and as many weights, none of them 0. A
+/// view of lists that all points of the skin share: lists of its own would take several times the memory.
 struct CSkinPointRecord
 {
     uint32_t point;
-    uint32_t bone; ///< index of the bone
-    float weight;
+    std::span<CSpatial* const> bones;
+    std::span<const float> weights;
+    std::span<const uint32_t> places; ///< of the bones in the bone table
+};
+
+/// Points from `begin` up to `end` with the same number of influences. A group is kept as runs of points, so
+/// that many skins on one large mesh do not take its size each.
+struct CSkinPointRun
+{
+    uint32_t begin;
+    uint32_t end;
+    size_t record; ///< of the first point in the point table; not used for points without influences
 };
 
 /// Moves the points of its target, a geometry, with bones. Matrices are blended and each point is transformed
@@ -59,21 +70,42 @@ public:
 
     /// A new bone comes with this offset; a known one keeps its own. To be followed by RebuildSkinTables.
     void AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset);
-    /// Sorts the influences by point. To be run when bones or influences have changed.
+    /// Makes the point table and the group table for the target's points. Must run when influences have
+    /// changed; an update notices by itself when bones or the number of points have.
     void RebuildSkinTables();
 
     const std::vector<CSkinBoneRecord>& Bones() const { return m_kBones; }
+    /// The points that bones move, in ascending order. Valid until the next rebuild.
+    const std::vector<CSkinPointRecord>& Points() const { return m_kPoints; }
+    /// Row g has the points with exactly g influences, in ascending order; row 0 those that no bone moves.
+    /// There is one row more than the most influences of any point.
+    const std::vector<std::vector<CSkinPointRun>>& Groups() const { return m_kGroups; }
 
 private:
+    struct Influence
+    {
+        uint32_t point;
+        uint32_t place;
+        float weight;
+    };
+
     CSkinBoneRecord& RecordOf(CSpatial& bone, const Mat4& offset);
-    uint32_t LiveBones() const;
+    std::vector<CSpatial*> CurrentBones() const;
+    std::vector<Influence> SortedInfluences() const;
+    void AddToGroup(size_t influences, uint32_t begin, uint32_t end);
+    bool AreTablesCurrent(size_t pointCount) const;
     std::vector<Mat4> SkinMatrices(const Mat4& before) const;
-    std::span<const CSkinPointRecord> TakeInfluences(size_t& next, uint32_t point) const;
 
     std::vector<CSkinBoneRecord> m_kBones; // in the order of the file or of their adding
-    // No entry for points that no bone moves: many skins on one large mesh must not take its size each.
+
+    // Derived from the bones and the number of points below. A copy starts without them and makes its own.
     std::vector<CSkinPointRecord> m_kPoints;
-    uint32_t m_uiLiveBones = 0; // when m_kPoints was made
+    std::vector<std::vector<CSkinPointRun>> m_kGroups;
+    std::vector<CSpatial*> m_kPointBones;
+    std::vector<float> m_kPointWeights;
+    std::vector<uint32_t> m_kPointPlaces;
+    std::vector<CSpatial*> m_kTableBones; // of the bone table then; null for one that had died
+    size_t m_uiTablePoints = 0;
 };
 
 } // namespace gw

@@ -3,8 +3,10 @@
 #include "CFieldArchive.h"
 #include "CHTMLTables.h"
 #include "CMaterialBase.h"
+#include "MakeBlock.h"
 
 #include <algorithm>
+#include <utility>
 
 namespace gw {
 
@@ -111,37 +113,39 @@ void CGeometry::ApplyRenderStates(RenderStateStack& stack)
 
 bool CGeometry::SetPointCount(int32_t count)
 {
-    if (count < 1)
+    std::vector<Vec3> model;
+    std::vector<Vec3> world;
+    if (count < 1 || !MakeBlock(model, count) || !MakeBlock(world, count))
         return false;
-    m_kXYZ.assign(static_cast<size_t>(count), kVec3Zero);
-    m_kWorldXYZ = m_kXYZ;
+    m_kXYZ = std::move(model);
+    m_kWorldXYZ = std::move(world);
     m_kXYZMtl.clear(); // one id for each point, or none
     return true;
 }
 
 bool CGeometry::SetNormalCount(int32_t count)
 {
-    if (count < 1)
+    std::vector<Vec3> model;
+    std::vector<Vec3> world;
+    if (count < 1 || !MakeBlock(model, count) || !MakeBlock(world, count))
         return false;
     m_iNormalCount = count;
-    m_kNormal.assign(static_cast<size_t>(count), kVec3Zero);
-    m_kWorldNormal = m_kNormal;
+    m_kNormal = std::move(model);
+    m_kWorldNormal = std::move(world);
     return true;
 }
 
 bool CGeometry::SetColorCount(int32_t count)
 {
-    if (count < 1)
+    if (count < 1 || !MakeBlock(m_kColor, count))
         return false;
     m_iColorCount = count;
-    m_kColor.assign(static_cast<size_t>(count), kVec3Zero);
     return true;
 }
 
 bool CGeometry::CreateXYZMtl()
 {
-    m_kXYZMtl.assign(m_kXYZ.size(), 0);
-    return !m_kXYZMtl.empty();
+    return !m_kXYZ.empty() && MakeBlock(m_kXYZMtl, static_cast<int64_t>(m_kXYZ.size()));
 }
 
 void CGeometry::GrowWorldPoints(size_t count)

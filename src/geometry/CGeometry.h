@@ -36,11 +36,12 @@ public:
     /// Takes the world points from model to world space, as they stand.
     virtual void UpdateWorldPoints();
 
-    /// Sizes model and world points; contents and material ids are lost. Below 1: false, and all stays.
+    /// Sizes model and world points; contents and material ids are lost. Returns false, and changes nothing,
+    /// below 1 or if there is not enough memory, as all sizing does.
     bool SetPointCount(int32_t count);
-    /// Sizes model and world normals; contents are lost. Below 1: false, and all stays.
+    /// Sizes model and world normals; contents are lost.
     bool SetNormalCount(int32_t count);
-    /// Sizes the colours; contents are lost. Below 1: false, and all stays.
+    /// Sizes the colours; contents are lost.
     bool SetColorCount(int32_t count);
     /// Gives each point a material id of 0; false when there are no points.
     bool CreateXYZMtl();

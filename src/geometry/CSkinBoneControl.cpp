@@ -5,6 +5,8 @@
 #include "SkinBones.h"
 
 #include <algorithm>
+#include <iterator>
+#include <utility>
 
 namespace gw {
 
@@ -53,23 +55,33 @@ uint64_t CSkinBoneControl::GetMemoryUsed() const
     return bytes;
 }
 
-CSkinBoneControl::Point& CSkinBoneControl::PointOf(uint32_t index)
+// Link ids are resolved in the order of the file, so its points are sorted after that.
+void CSkinBoneControl::Link(COrrinStream& stream, CLinkRecord& record)
 {
-    if (m_kPlaces.empty())
+    CControl::Link(stream, record);
+    SortPoints();
+}
+
+void CSkinBoneControl::SortPoints()
+{
+    std::ranges::stable_sort(m_kPoints, {}, &Point::m_uiIndex);
+    std::vector<Point> points;
+    for (Point& point : m_kPoints)
     {
-        for (size_t place = 0; place < m_kPoints.size(); ++place)
-            m_kPlaces.emplace(m_kPoints[place].m_uiIndex, place);
+        if (points.empty() || points.back().m_uiIndex != point.m_uiIndex)
+            points.push_back(std::move(point));
+        else
+            std::ranges::move(point.m_kEntries, std::back_inserter(points.back().m_kEntries));
     }
-    const auto [known, isNew] = m_kPlaces.emplace(index, m_kPoints.size());
-    if (isNew)
-        m_kPoints.emplace_back().m_uiIndex = index;
-    return m_kPoints[known->second];
+    m_kPoints = std::move(points);
 }
 
 void CSkinBoneControl::AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset)
 {
-    std::vector<Entry>& entries = PointOf(point).m_kEntries;
-    Entry& entry = *entries.emplace(entries.begin());
+    auto place = std::ranges::lower_bound(m_kPoints, point, {}, &Point::m_uiIndex);
+    if (place == m_kPoints.end() || place->m_uiIndex != point)
+        place = m_kPoints.insert(place, Point{point, {}});
+    Entry& entry = *place->m_kEntries.emplace(place->m_kEntries.begin());
     entry.m_pkBone.Set(&bone);
     entry.m_fWeight = weight;
     entry.m_kOffset = offset;
@@ -80,7 +92,6 @@ bool CSkinBoneControl::Bind(CObject& root)
     CControl::Bind(root);
     CBonesByName bones(root);
     const std::vector<Point> old = std::exchange(m_kPoints, {});
-    m_kPlaces.clear();
     for (const Point& point : old)
     {
         for (const Entry& entry : point.m_kEntries)

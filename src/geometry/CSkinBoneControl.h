@@ -4,7 +4,6 @@
 #include "Mat4.h"
 #include "Vec3.h"
 
-#include <unordered_map>
 #include <vector>
 
 namespace gw {
@@ -38,6 +37,7 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
+    void Link(COrrinStream& stream, CLinkRecord& record) override;
     uint64_t GetMemoryUsed() const override;
     /// A point without an entry collapses to the origin. False where it is off or its target is no geometry.
     bool Update(float time) override;
@@ -47,17 +47,17 @@ public:
     /// Goes over to the copies of the bones; entries of a bone without a copy are gone.
     bool Rebind(const CCloneMap& map) override;
 
+    /// Adds an influence in front of the others of its point.
     void AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset);
 
+    /// In ascending order of their indices, each once.
     const std::vector<Point>& Points() const { return m_kPoints; }
 
 private:
-    Point& PointOf(uint32_t index);
+    void SortPoints();
     Vec3 Blend(const Point& point, const Vec3& model) const;
 
-    std::vector<Point> m_kPoints; // in the order of the file or of their adding
-    std::unordered_map<uint32_t, size_t>
-        m_kPlaces; // where a point stands above; made when it is first asked for
+    std::vector<Point> m_kPoints;
 };
 
 } // namespace gw

@@ -3,6 +3,7 @@
 #include "CFieldArchive.h"
 #include "CHTMLTables.h"
 #include "CTriMeshUVWMap.h"
+#include "MakeBlock.h"
 
 #include <algorithm>
 #include <numeric>
@@ -185,30 +186,33 @@ void CTriMesh::UpdateWorldNormals()
 
 bool CTriMesh::SetTriangleQuantity(int32_t count)
 {
-    if (count < 1)
+    const int64_t corners = int64_t{3} * count;
+    std::vector<uint32_t> points;
+    std::vector<uint32_t> normals;
+    std::vector<uint32_t> colors;
+    if (count < 1 || !MakeBlock(points, XYZBuffer().empty() ? 0 : corners) ||
+        !MakeBlock(normals, NormalBuffer().empty() ? 0 : corners) ||
+        !MakeBlock(colors, ColorBuffer().empty() ? 0 : corners))
         return false;
     m_kVertexTriIndex.clear();
     m_kTriangleMtlID.clear();
     m_kSmoothFlag.clear();
     m_apkUVWMap.clear();
     m_iTriangleCount = count;
-    const size_t corners = size_t{3} * static_cast<size_t>(count);
-    m_kXYZTriIndex.assign(XYZBuffer().empty() ? 0 : corners, 0);
-    m_kNormalTriIndex.assign(NormalBuffer().empty() ? 0 : corners, 0);
-    m_kColorTriIndex.assign(ColorBuffer().empty() ? 0 : corners, 0);
+    m_kXYZTriIndex = std::move(points);
+    m_kNormalTriIndex = std::move(normals);
+    m_kColorTriIndex = std::move(colors);
     return true;
 }
 
 bool CTriMesh::CreateTriangleMtlID()
 {
-    m_kTriangleMtlID.assign(static_cast<size_t>(std::max(m_iTriangleCount, 0)), 0);
-    return m_iTriangleCount > 0;
+    return MakeBlock(m_kTriangleMtlID, m_iTriangleCount) && m_iTriangleCount > 0;
 }
 
 bool CTriMesh::CreateSmoothFlag()
 {
-    m_kSmoothFlag.assign(static_cast<size_t>(std::max(m_iTriangleCount, 0)), 0);
-    return m_iTriangleCount > 0;
+    return MakeBlock(m_kSmoothFlag, m_iTriangleCount) && m_iTriangleCount > 0;
 }
 
 void CTriMesh::BuildVertexTable()

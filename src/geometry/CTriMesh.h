@@ -37,7 +37,8 @@ public:
     void UpdateWorldNormals() override;
 
     /// Drops all triangles with their lists and maps, then makes index lists for the blocks that are there:
-    /// points, normals, colours. Below 1: false, and all stays.
+    /// points, normals, colours. Returns false, and changes nothing, below 1 or if there is not enough
+    /// memory.
     bool SetTriangleQuantity(int32_t count);
     /// Gives each triangle a material id, or a smoothing mask, of 0; false when there are no triangles.
     bool CreateTriangleMtlID();

@@ -2,6 +2,7 @@
 
 #include "CFieldArchive.h"
 #include "CHTMLTables.h"
+#include "MakeBlock.h"
 
 namespace gw {
 
@@ -37,19 +38,17 @@ uint64_t CTriMeshUVWMap::GetMemoryUsed() const
 
 bool CTriMeshUVWMap::SetUVWCount(int32_t count)
 {
-    if (count < 1)
+    if (count < 1 || !MakeBlock(m_kUVW, count))
         return false;
     m_iUVWCount = count;
-    m_kUVW.assign(static_cast<size_t>(count), kVec3Zero);
     return true;
 }
 
 bool CTriMeshUVWMap::SetTriangleQuantity(int32_t count)
 {
-    if (count < 1)
+    if (count < 1 || !MakeBlock(m_kUVWTriIndex, int64_t{3} * count))
         return false;
     m_iTriangleCount = count;
-    m_kUVWTriIndex.assign(size_t{3} * static_cast<size_t>(count), 0);
     return true;
 }
 

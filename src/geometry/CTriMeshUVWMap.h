@@ -21,9 +21,10 @@ public:
     void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Sizes the coordinates; contents are lost. Below 1: false, and all stays.
+    /// Sizes the coordinates; contents are lost. Returns false, and changes nothing, below 1 or if there is
+    /// not enough memory.
     bool SetUVWCount(int32_t count);
-    /// Sizes the triangles' index list; contents are lost. Below 1: false, and all stays.
+    /// Sizes the triangles' index list; contents are lost. Fails like SetUVWCount.
     bool SetTriangleQuantity(int32_t count);
     /// Sizes the list of render vertices, which a mesh fills when it builds its vertex table.
     void SetVertexCount(size_t count);

@@ -1,6 +1,9 @@
 #include "CCustomData.h"
 
 #include "CFieldArchive.h"
+#include "CMappedFile.h"
+
+#include <algorithm>
 
 namespace gw {
 
@@ -44,14 +47,53 @@ CObject* CRawData::CreateClone() const
 void CRawData::Fields(CFieldArchive& archive)
 {
     CCustomData::Fields(archive);
-    uint32_t byteCount = static_cast<uint32_t>(m_pbyData.size());
-    archive.Unsigned("m_uiDataSize", byteCount);
-    archive.OptionalBlock("m_pbyData", m_pbyData, byteCount);
+    archive.Unsigned("m_uiDataSize", m_uiDataSize);
+    if (archive.IsReading())
+    {
+        std::vector<std::byte> bytes;
+        archive.OptionalBlock("m_pbyData", bytes, m_uiDataSize);
+        SetData(std::move(bytes)); // a size without a block is 0
+        return;
+    }
+    // Archives that do not read change nothing.
+    std::span<std::byte> bytes(const_cast<std::byte*>(m_pbyData.get()), m_uiDataSize);
+    if (archive.Presence("m_pbyData", !bytes.empty()))
+        archive.Row("m_pbyData", bytes);
+}
+
+void CRawData::SetData(std::vector<std::byte>&& bytes)
+{
+    const auto block = std::make_shared<std::vector<std::byte>>(std::move(bytes));
+    m_uiDataSize = static_cast<uint32_t>(block->size());
+    m_pbyData = {block, block->data()};
+    m_spkFile = nullptr;
+}
+
+void CRawData::SetData(CMappedFile&& file)
+{
+    m_spkFile = std::make_shared<CMappedFile>(std::move(file));
+    m_uiDataSize = static_cast<uint32_t>(m_spkFile->Bytes().size());
+    m_pbyData = {m_spkFile, m_spkFile->Bytes().data()};
+}
+
+bool CRawData::WriteData(const CByteSink& sink) const
+{
+    constexpr size_t kPieceBytes = size_t{8} << 20;
+    for (size_t done = 0; done < m_uiDataSize;)
+    {
+        const size_t count = std::min(m_uiDataSize - done, kPieceBytes);
+        if (!sink(Data().subspan(done, count)))
+            return false;
+        done += count;
+        if (m_spkFile)
+            m_spkFile->Forget(done);
+    }
+    return true;
 }
 
 uint64_t CRawData::GetMemoryUsed() const
 {
-    return CCustomData::GetMemoryUsed() + 8 + m_pbyData.size();
+    return CCustomData::GetMemoryUsed() + 8 + m_uiDataSize;
 }
 
 CAuthorInfo::CAuthorInfo() = default;

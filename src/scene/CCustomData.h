@@ -1,11 +1,15 @@
 #pragma once
 
+#include "CByteSink.h"
 #include "CObject.h"
 
 #include <cstddef>
+#include <memory>
 #include <span>
 
 namespace gw {
+
+class CMappedFile;
 
 /// A tagged object that a container carries without knowing what it means; a chain of them hangs on any
 /// object.
@@ -54,13 +58,20 @@ public:
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Stores a copy of the bytes; none leave no block.
-    void SetData(std::span<const std::byte> bytes) { m_pbyData.assign(bytes.begin(), bytes.end()); }
-    void SetData(std::vector<std::byte>&& bytes) { m_pbyData = std::move(bytes); }
-    std::span<const std::byte> Data() const { return m_pbyData; }
+    /// Stores a copy of the bytes; no bytes leave no block.
+    void SetData(std::span<const std::byte> bytes) { SetData(std::vector(bytes.begin(), bytes.end())); }
+    void SetData(std::vector<std::byte>&& bytes);
+    /// Refers to the bytes of a file of at most 4 GiB without copying them.
+    void SetData(CMappedFile&& file);
+    std::span<const std::byte> Data() const { return {m_pbyData.get(), m_uiDataSize}; }
+    /// Passes the bytes on in pieces. Memory that a piece of a mapped file took is freed after it. False as
+    /// soon as the sink returns false.
+    bool WriteData(const CByteSink& sink) const;
 
 private:
-    std::vector<std::byte> m_pbyData;
+    uint32_t m_uiDataSize = 0;
+    std::shared_ptr<const std::byte> m_pbyData; // never changes once set, so copies of the object share it
+    std::shared_ptr<CMappedFile> m_spkFile;     // which the block is in; null for a block in memory
 };
 
 /// Five texts about a file's author. Its class record names CObject as base although it is a CCustomData in

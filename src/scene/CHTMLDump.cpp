@@ -5,38 +5,11 @@
 #include "HTMLMarkup.h"
 #include "HTMLText.h"
 
-#include <span>
+#include <utility>
 
 namespace gw {
 
 namespace {
-
-// A node of the tree with the one above it, null at the root.
-struct TreeEntry
-{
-    CObject* object;
-    CObject* parent;
-};
-
-// Level by level. A node with several places stands at the first.
-std::vector<TreeEntry> TreeOf(CObject& root, std::unordered_set<const CObject*>& inTree)
-{
-    std::vector<TreeEntry> entries{
-        {&root, nullptr}
-    };
-    inTree.insert(&root);
-    for (size_t i = 0; i < entries.size(); ++i)
-    {
-        CNode* const node = RecordCast<CNode>(entries[i].object);
-        for (size_t slot = 0; node && slot < node->GetChildCount(); ++slot)
-        {
-            CNode* const child = RecordCast<CNode>(node->ChildAt(slot));
-            if (child && inTree.insert(child).second)
-                entries.push_back({child, node});
-        }
-    }
-    return entries;
-}
 
 // What the script calls a node.
 std::string ScriptName(const CObject& object)
@@ -48,20 +21,6 @@ std::string FolderCall(const CObject& object)
 {
     return "gFld(\"" + HTMLScriptText(object.NameView()) + "\", \"" +
            GetHTMLFileName(object, EHTMLPath::Bare) + " target=mainFrame\")";
-}
-
-std::string TreeScript(std::span<const TreeEntry> entries)
-{
-    std::string script = "\n";
-    for (const TreeEntry& entry : entries)
-    {
-        script += ScriptName(*entry.object) + " = ";
-        if (entry.parent)
-            script += "insFld(" + ScriptName(*entry.parent) + ", " + FolderCall(*entry.object) + ");\n";
-        else
-            script += FolderCall(*entry.object) + ";\n";
-    }
-    return script + "initializeDocument(" + ScriptName(*entries.front().object) + ")\n";
 }
 
 void AddLines(COrnHTMLPage& page, std::initializer_list<const char*> lines)
@@ -82,7 +41,59 @@ COrnHTMLWriter IndexPage(const CObject& root, const std::string& treeName)
     return page;
 }
 
-COrnHTMLWriter TreePage(std::span<const TreeEntry> entries)
+// Every page of an object names its code page, because it may be opened by itself.
+COrnHTMLWriter ObjectPage()
+{
+    COrnHTMLWriter page;
+    page.AddLine(kHTMLCodePage);
+    return page;
+}
+
+} // namespace
+
+CHTMLDump* CHTMLDump::ms_pkRunning = nullptr;
+
+// Level by level. What is listed but not expanded keeps the tree no larger than the graph has links.
+std::vector<CHTMLDump::TreeEntry> CHTMLDump::TreeOf(CObject& root)
+{
+    std::unordered_set<const CObject*> inTree{&root};
+    std::vector<TreeEntry> entries{
+        {&root, nullptr, true}
+    };
+    for (size_t i = 0; i < entries.size(); ++i)
+    {
+        CNode* const node = entries[i].isFirst ? RecordCast<CNode>(entries[i].object) : nullptr;
+        if (!node || (!m_kExpanded.insert(node).second && m_uiEntries >= kEntryLimit))
+            continue;
+        for (size_t slot = 0; slot < node->GetChildCount(); ++slot)
+        {
+            CNode* const child = RecordCast<CNode>(node->ChildAt(slot));
+            if (!child)
+                continue;
+            entries.push_back({child, node, inTree.insert(child).second});
+            ++m_uiEntries;
+        }
+    }
+    return entries;
+}
+
+// Only the first entry of a node gets a name in the script: its children go there.
+std::string CHTMLDump::TreeScript(const std::vector<TreeEntry>& entries)
+{
+    std::string script = "\n";
+    for (const TreeEntry& entry : entries)
+    {
+        if (entry.isFirst)
+            script += ScriptName(*entry.object) + " = ";
+        if (entry.parent)
+            script += "insFld(" + ScriptName(*entry.parent) + ", " + FolderCall(*entry.object) + ");\n";
+        else
+            script += FolderCall(*entry.object) + ";\n";
+    }
+    return script + "initializeDocument(" + ScriptName(*entries.front().object) + ")\n";
+}
+
+COrnHTMLWriter CHTMLDump::TreePage(const std::vector<TreeEntry>& entries)
 {
     COrnHTMLWriter page;
     AddLines(page, {"<html>", "<head>"});
@@ -94,16 +105,6 @@ COrnHTMLWriter TreePage(std::span<const TreeEntry> entries)
     return page;
 }
 
-// Every page of an object tells its code page, for it may be opened by itself.
-COrnHTMLWriter ObjectPage()
-{
-    COrnHTMLWriter page;
-    page.AddLine(kHTMLCodePage);
-    return page;
-}
-
-} // namespace
-
 void CHTMLDump::Save(const COrnHTMLPage& page, const std::string& fileName)
 {
     ++m_uiPages;
@@ -111,7 +112,7 @@ void CHTMLDump::Save(const COrnHTMLPage& page, const std::string& fileName)
         ++m_uiFailed;
 }
 
-void CHTMLDump::AddTables(COrnHTMLPage& page, CObject& object)
+void CHTMLDump::AddTables(COrnHTMLWriter& page, CObject& object)
 {
     CHTMLTables tables(page);
     object.DumpTable(tables);
@@ -123,17 +124,39 @@ void CHTMLDump::AddTables(COrnHTMLPage& page, CObject& object)
     }
 }
 
-void CHTMLDump::Fill(COrnHTMLPage& page, CObject& object)
+void CHTMLDump::AddObject(const std::string& folder, COrnHTMLWriter& page, CObject& object)
 {
-    m_kKnown.insert(&object);
-    AddTables(page, object);
+    if (ms_pkRunning)
+        return ms_pkRunning->AddTables(page, object);
+    CHTMLDump dump(folder);
+    dump.m_kKnown.insert(&object);
+    dump.AddTables(page, object);
+    dump.SaveWaiting();
+}
+
+void CHTMLDump::SavePageOf(CObject& object)
+{
+    struct Running
+    {
+        explicit Running(CHTMLDump& dump) : outer(std::exchange(ms_pkRunning, &dump)) {}
+        ~Running() { ms_pkRunning = outer; }
+        CHTMLDump* outer;
+    };
+    COrnHTMLWriter page = ObjectPage();
+    {
+        const Running running(*this);
+        object.DumpHTML(m_kFolder, page);
+    }
+    Save(page, GetHTMLFileName(object, EHTMLPath::Bare));
+}
+
+void CHTMLDump::SaveWaiting()
+{
     while (!m_kWaiting.empty())
     {
         CObject& next = *m_kWaiting.back();
         m_kWaiting.pop_back();
-        COrnHTMLWriter own = ObjectPage();
-        AddTables(own, next);
-        Save(own, GetHTMLFileName(next, EHTMLPath::Bare));
+        SavePageOf(next);
     }
 }
 
@@ -141,13 +164,10 @@ std::string CHTMLDump::WriteSite(CObject& root)
 {
     const std::string ending = (++m_uiSites == 1 ? "" : std::to_string(m_uiSites)) + ".htm";
     Save(IndexPage(root, "TreeView" + ending), "Index" + ending);
-    Save(TreePage(TreeOf(root, m_kInTree)), "TreeView" + ending);
-    if (!m_kKnown.contains(&root))
-    {
-        COrnHTMLWriter page = ObjectPage();
-        Fill(page, root);
-        Save(page, GetHTMLFileName(root, EHTMLPath::Bare));
-    }
+    Save(TreePage(TreeOf(root)), "TreeView" + ending);
+    if (m_kKnown.insert(&root).second)
+        m_kWaiting.push_back(&root);
+    SaveWaiting();
     return "Index" + ending;
 }
 

@@ -194,7 +194,7 @@ void CObject::Save(COrrinStream& stream)
 
 void CObject::DumpHTML(const std::string& folder, COrnHTMLWriter& page)
 {
-    CHTMLDump(folder).Fill(page, *this);
+    CHTMLDump::AddObject(folder, page, *this);
 }
 
 void CObject::DumpTable(CHTMLTables& tables)
@@ -326,18 +326,16 @@ bool CObject::AttachControl(CControl* control)
 
 bool CObject::AttachModifier(CControl* modifier)
 {
-    if (!modifier || modifier->GetTarget())
+    CModifier* last = nullptr;
+    ForEachModifier(m_spkModifier.Get(), [&](CModifier& link) { last = &link; });
+    // A file may have put any object at the head, and nothing can follow that.
+    if (!modifier || modifier->GetTarget() || (m_spkModifier && !last))
         return false;
     for (CControl* link = modifier; link; link = link->GetNext())
         link->SetTarget(this);
     if (!m_spkModifier)
-    {
         m_spkModifier = modifier;
-        return true;
-    }
-    CModifier* last = nullptr;
-    ForEachModifier(m_spkModifier.Get(), [&](CModifier& link) { last = &link; });
-    if (last && last != modifier)
+    else if (last != modifier)
         last->SetNext(modifier);
     return true;
 }

@@ -51,9 +51,9 @@ public:
     virtual const CRTTI* GetRTTI() const { return &ms_kRTTI; }
     /// A new object by the copy constructor, with count 0; null for abstract classes.
     virtual CObject* CreateClone() const { return nullptr; }
-    /// A copy with copies of all that it holds; an object that the map knows gives the copy made before.
-    /// Plain links of the copies lead to copies where there are any.
-    CObject* Clone(CCloneMap& map);
+    /// Copies the object together with everything it holds. An object that the map already knows returns the
+    /// copy made before. Plain links of the copies point to other copies if there are any.
+    virtual CObject* Clone(CCloneMap& map);
 
     /// The class's stored fields, base first, in file order: the one place that says what a file holds.
     virtual void Fields(CFieldArchive& archive);
@@ -69,9 +69,10 @@ public:
     /// Writes a small web site about this object and all below it, for developers. Only nodes do. The folder
     /// stands straight before each file name, so it ends in a separator.
     virtual void WriteHTMLFrames(const std::string&) {}
-    /// Puts the object's tables on a page, and saves the pages of all that it leads to, each once.
-    void DumpHTML(const std::string& folder, COrnHTMLWriter& page);
-    /// The class's table on such a page, base first.
+    /// Adds the object's tables to a page and saves the pages of everything it links to, each once. While a
+    /// larger dump is running, that dump saves the other pages.
+    virtual void DumpHTML(const std::string& folder, COrnHTMLWriter& page);
+    /// Adds the tables of the object's classes, base first.
     virtual void DumpTable(CHTMLTables& tables);
 
     /// Bytes in memory, by the fixed sizes of the object model.
@@ -110,7 +111,8 @@ public:
     /// Appends a control, with the chain behind it, to the control chain and targets it here. False for null
     /// and for a control that has a target already.
     bool AttachControl(CControl* control);
-    /// The same for the modifier chain, whose end is the first object that is no modifier.
+    /// Does the same for the modifier chain, which ends at the first object that is not a modifier. False,
+    /// with nothing changed, also if the head itself is not a modifier.
     bool AttachModifier(CControl* modifier);
     /// Makes a custom data object the head of its chain. With a head there already the end is looked for in
     /// the control chain, as it has always been, and where that is no custom data nothing changes: false.

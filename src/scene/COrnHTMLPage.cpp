@@ -1,17 +1,35 @@
 #include "COrnHTMLPage.h"
 
+#include "CSafeFile.h"
+
 #include <cstdarg>
+#include <filesystem>
+#include <string_view>
 
 namespace gw {
 
+namespace {
+
+ssize_t WriteSafely(void* file, const char* text, size_t size)
+{
+    return static_cast<CSafeFile*>(file)->Write(std::string_view(text, size)) ? static_cast<ssize_t>(size)
+                                                                              : 0;
+}
+
+} // namespace
+
 bool COrnHTMLPage::SaveAs(const std::string& path) const
 {
-    std::FILE* file = std::fopen(path.c_str(), "wt");
-    if (!file)
+    std::error_code error;
+    CSafeFile file;
+    if (std::filesystem::is_symlink(path, error) || !file.Open(path))
         return false;
-    WriteTo(file);
-    const bool taken = !std::ferror(file);
-    return std::fclose(file) == 0 && taken;
+    std::FILE* stream =
+        fopencookie(&file, "w", {.read = nullptr, .write = WriteSafely, .seek = nullptr, .close = nullptr});
+    if (!stream)
+        return false;
+    WriteTo(stream);
+    return std::fclose(stream) == 0 && file.Commit(); // which fails if any write did
 }
 
 void COrnHTMLPage::WriteTo(std::FILE* file) const

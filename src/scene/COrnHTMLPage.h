@@ -12,7 +12,8 @@ class COrnHTMLPage
 public:
     virtual ~COrnHTMLPage() = default;
 
-    /// Writes the page to a file. False when it cannot be opened or did not take all.
+    /// Writes the page to a file, replacing an old one in one step. False, with the old one kept, if the file
+    /// cannot be written or is not a regular file: a link could lead out of the folder.
     virtual bool SaveAs(const std::string& path) const;
     virtual bool SaveAsText(const char* path) const { return SaveAs(path); }
     /// Prints the lines, each with its end, and then the nested pages.

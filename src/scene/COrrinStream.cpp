@@ -166,6 +166,7 @@ bool COrrinStream::LoadFile(const std::string& path, bool thumbnailOnly)
 
 bool COrrinStream::LoadThumbnailOnly(std::span<const std::byte> bytes, size_t position)
 {
+    m_kRecord.Clear();
     if (position == 0)
         m_kVersion = kNewestVersion;
     CFieldReader reader(bytes, position, m_kVersion, m_kRecord);

@@ -7,6 +7,8 @@
 #include "HTMLMarkup.h"
 #include "HTMLText.h"
 
+#include <utility>
+
 namespace gw {
 
 const CRTTI CSpatial::ms_kRTTI{"CSpatial", &CObject::ms_kRTTI};
@@ -24,10 +26,15 @@ CSpatial::CSpatial(const CSpatial& source)
 
 void CSpatial::CloneHeld(CCloneMap& map, CObject& copy)
 {
-    auto& states = static_cast<CSpatial&>(copy).m_pkRenderStates;
-    states.resize(m_pkRenderStates.size());
+    CSpatial& spatial = static_cast<CSpatial&>(copy);
+    spatial.m_pkRenderStates.resize(m_pkRenderStates.size()); // the links after them are matched by position
     CObject::CloneHeld(map, copy);
-    std::erase(states, nullptr);
+    // Attaching puts each state at the front, so the copy's list is in reverse order.
+    for (const auto& state : std::exchange(spatial.m_pkRenderStates, {}))
+    {
+        if (state)
+            spatial.AttachRenderState(*state);
+    }
 }
 
 void CSpatial::Fields(CFieldArchive& archive)

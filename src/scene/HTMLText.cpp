@@ -2,11 +2,14 @@
 
 #include "Numbers.h"
 
+#include <algorithm>
 #include <cfloat>
-#include <charconv>
 #include <cstdint>
-#include <iterator>
+#include <cstdio>
+#include <optional>
 #include <span>
+
+#include <iconv.h>
 
 namespace gw {
 
@@ -25,130 +28,57 @@ constexpr EscapeRow kPageEscapes[] = {
     {'"', "&quot;"},
 };
 
-// No "<" either: a script element looks for its end in texts too.
-constexpr EscapeRow kScriptEscapes[] = {
-    {'\\', "\\\\" },
-    {'"',  "\\\"" },
-    {'<',  "\\x3c"},
-    {'\n', "\\n"  },
-    {'\r', "\\r"  },
-};
-
-// Where a name goes: what its characters become there.
-struct Place
+// The code points of a name in a character set of the C library; nothing if its bytes are not of that set.
+std::optional<std::u32string> CodePoints(std::string_view name, const char* characterSet)
 {
-    std::span<const EscapeRow> escapes;
-    std::string_view pointBegin; // around a code point in decimal or hexadecimal digits
-    std::string_view pointEnd;
-    int base;
-};
-
-constexpr Place kInPage{kPageEscapes, "&#", ";", 10};
-constexpr Place kInScript{kScriptEscapes, "\\u{", "}", 16};
-
-// A form of two to four bytes: its first byte, and the least point that may take it.
-struct Utf8Row
-{
-    uint8_t mask;
-    uint8_t mark;
-    size_t length;
-    uint32_t least;
-};
-
-constexpr Utf8Row kUtf8[] = {
-    {0xe0, 0xc0, 2, 0x80   },
-    {0xf0, 0xe0, 3, 0x800  },
-    {0xf8, 0xf0, 4, 0x10000},
-};
-
-uint8_t ByteAt(std::string_view text, size_t index)
-{
-    return static_cast<uint8_t>(text[index]);
+    constexpr size_t kPointsPerByte = 2; // at most, in Big5: a letter with its accent
+    constexpr char32_t kLastPoint = 0x10ffff;
+    const iconv_t converter = iconv_open("UCS-4LE", characterSet);
+    if (converter == reinterpret_cast<iconv_t>(-1))
+        return std::nullopt;
+    std::u32string points(kPointsPerByte * name.size(), U'\0');
+    char* from = const_cast<char*>(name.data()); // the interface is older than const
+    char* to = reinterpret_cast<char*>(points.data());
+    size_t fromBytes = name.size();
+    size_t toBytes = points.size() * sizeof(char32_t);
+    const bool isWhole = iconv(converter, &from, &fromBytes, &to, &toBytes) != static_cast<size_t>(-1) &&
+                         iconv(converter, nullptr, nullptr, &to, &toBytes) != static_cast<size_t>(-1);
+    iconv_close(converter);
+    points.resize(points.size() - toBytes / sizeof(char32_t));
+    if (!isWhole || std::ranges::any_of(points, [](char32_t point) { return point > kLastPoint; }))
+        return std::nullopt;
+    return points;
 }
 
-bool IsPoint(uint32_t point)
+void AppendToPage(std::string& out, char character)
 {
-    return point <= 0x10ffff && (point < 0xd800 || point > 0xdfff);
-}
-
-// Takes a character that is no ASCII off the front; 0 where there is none.
-uint32_t TakePoint(std::string_view& rest)
-{
-    for (const Utf8Row& row : kUtf8)
+    for (const EscapeRow& row : kPageEscapes)
     {
-        if ((ByteAt(rest, 0) & row.mask) != row.mark || rest.size() < row.length)
+        if (row.character != character)
             continue;
-        uint32_t point = ByteAt(rest, 0) & static_cast<uint8_t>(~row.mask);
-        for (size_t i = 1; i < row.length; ++i)
-        {
-            if ((ByteAt(rest, i) & 0xc0) != 0x80)
-                return 0;
-            point = point << 6 | (ByteAt(rest, i) & 0x3f);
-        }
-        rest.remove_prefix(row.length);
-        return point >= row.least && IsPoint(point) ? point : 0;
+        out += row.text;
+        return;
     }
-    return 0;
+    out += character;
 }
 
-bool IsASCII(std::string_view rest)
+// A browser reads a page's bytes as Big5, where the second byte of a character may be a backslash, a letter
+// or a brace. After a byte above 7F an escape would therefore not be one, and a quote would end the text. So
+// a script gets no such bytes, and no "<" either, because a script element looks for its end in texts too.
+bool IsPlainInScript(char32_t point)
 {
-    return ByteAt(rest, 0) < 0x80;
+    return point >= U' ' && point <= U'~' && point != U'"' && point != U'\\' && point != U'<';
 }
 
-bool IsUtf8(std::string_view text)
+void AppendToScript(std::string& out, char32_t point)
 {
-    while (!text.empty())
-    {
-        if (IsASCII(text))
-            text.remove_prefix(1);
-        else if (TakePoint(text) == 0)
-            return false;
-    }
-    return true;
-}
-
-// The second byte of a Big5 character may be a backslash, which then is none. After the other first bytes a
-// browser takes it for itself.
-bool IsBig5WithBackslash(std::string_view rest)
-{
-    return rest.size() > 1 && rest[1] == '\\' && ByteAt(rest, 0) >= 0xa1 && ByteAt(rest, 0) <= 0xf9 &&
-           ByteAt(rest, 0) != 0xc8;
-}
-
-std::string_view Escaped(const Place& place, const char& character)
-{
-    for (const EscapeRow& row : place.escapes)
-    {
-        if (row.character == character)
-            return row.text;
-    }
-    return {&character, 1};
-}
-
-void AppendPoint(std::string& out, const Place& place, uint32_t point)
-{
-    char digits[16];
-    char* const end = std::to_chars(digits, std::end(digits), point, place.base).ptr;
-    out.append(place.pointBegin).append(std::begin(digits), end).append(place.pointEnd);
-}
-
-std::string Shown(std::string_view name, const Place& place)
-{
-    std::string out;
-    const bool isUtf8 = IsUtf8(name);
-    while (!name.empty())
-    {
-        if (!IsASCII(name) && isUtf8)
-        {
-            AppendPoint(out, place, TakePoint(name));
-            continue;
-        }
-        const size_t taken = IsBig5WithBackslash(name) ? 2 : 1;
-        out += taken == 2 ? name.substr(0, 2) : Escaped(place, name.front());
-        name.remove_prefix(taken);
-    }
-    return out;
+    char escape[16];
+    if (IsPlainInScript(point))
+        out += static_cast<char>(point);
+    else
+        out.append(escape, static_cast<size_t>(std::snprintf(escape, sizeof escape,
+                                                             point < 0x100 ? "\\x%02x" : "\\u{%x}",
+                                                             static_cast<unsigned>(point))));
 }
 
 std::string InBrackets(std::span<const float> values)
@@ -167,12 +97,37 @@ std::string InBrackets(std::span<const float> values)
 
 std::string HTMLText(std::string_view name)
 {
-    return Shown(name, kInPage);
+    std::string out;
+    if (const auto points = CodePoints(name, "UTF-8"))
+    {
+        for (const char32_t point : *points)
+        {
+            if (point > U'~')
+                out += "&#" + std::to_string(static_cast<uint32_t>(point)) + ';';
+            else
+                AppendToPage(out, static_cast<char>(point));
+        }
+        return out;
+    }
+    for (const char byte : name)
+        AppendToPage(out, byte);
+    return out;
 }
 
 std::string HTMLScriptText(std::string_view name)
 {
-    return Shown(name, kInScript);
+    std::string out;
+    for (const char* characterSet : {"UTF-8", "BIG5-HKSCS"})
+    {
+        const auto points = CodePoints(name, characterSet);
+        for (const char32_t point : points.value_or(U""))
+            AppendToScript(out, point);
+        if (points)
+            return out;
+    }
+    for (const char byte : name)
+        AppendToScript(out, static_cast<uint8_t>(byte));
+    return out;
 }
 
 std::string HTMLText(float value)

@@ -10,11 +10,12 @@
 namespace gw {
 
 // Values and names as the pages of the HTML dump show them. The pages are in the Big5 code page, and names
-// are in whatever a file's maker used: what is UTF-8 is shown by its code points, anything else as its bytes.
+// are in whatever encoding their author used: UTF-8 is shown by its code points, anything else by its bytes.
 
-/// A name as text of a page, with nothing in it that could be markup.
+/// Returns a name as text of a page, without anything in it that could be markup.
 std::string HTMLText(std::string_view name);
-/// A name as what stands between the quotes of a script's text.
+/// Returns a name for use between double quotes in a script: printable ASCII only, everything else escaped.
+/// Big5 names are escaped by their code points, names in any other encoding by their bytes.
 std::string HTMLScriptText(std::string_view name);
 
 /// Three decimals; INFINITY and -INFINITY for the largest numbers and beyond.

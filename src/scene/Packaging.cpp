@@ -6,30 +6,9 @@
 #include "CPackageFile.h"
 #include "Paths.h"
 
-#include <algorithm>
+#include <utility>
 
 namespace gw {
-
-namespace {
-
-constexpr size_t kPieceBytes = size_t{8} << 20;
-
-bool CopyMotion(CMappedFile& motion, CPackageFile& package)
-{
-    const std::span<const std::byte> bytes = motion.Bytes();
-    size_t done = 0;
-    while (done < bytes.size())
-    {
-        const size_t count = std::min(bytes.size() - done, kPieceBytes);
-        if (!package.Write(bytes.subspan(done, count)))
-            return false;
-        done += count;
-        motion.Forget(done);
-    }
-    return true;
-}
-
-} // namespace
 
 Ref<CRawData> LoadFileAsRawData(const std::string& path)
 {
@@ -37,7 +16,7 @@ Ref<CRawData> LoadFileAsRawData(const std::string& path)
     if (file.Open(path) != EFailure::None)
         return nullptr;
     Ref<CRawData> data = new CRawData;
-    data->SetData(file.Bytes());
+    data->SetData(std::move(file));
     return data;
 }
 
@@ -47,11 +26,12 @@ bool PackageMotion(const std::string& sourcePath, const std::string& targetPath,
     uint64_t byteCount = 0;
     if (FileSize(sourcePath, byteCount) && byteCount > kContainerBytesLimit)
         return record.Fail(EFailure::TooLarge, 0, sourcePath);
-    CMappedFile motion;
-    if (motion.Open(sourcePath) != EFailure::None)
+    const Ref<CRawData> motion = LoadFileAsRawData(sourcePath);
+    if (!motion)
         return record.Fail(EFailure::NotFound, 0, sourcePath);
     CPackageFile package;
-    if (!package.Open(targetPath, {FormatCode(sourcePath), third, fourth}) || !CopyMotion(motion, package) ||
+    const CByteSink sink = [&](std::span<const std::byte> bytes) { return package.Write(bytes); };
+    if (!package.Open(targetPath, {FormatCode(sourcePath), third, fourth}) || !motion->WriteData(sink) ||
         !package.Commit())
         record.Fail(package.Failure(), 0, targetPath);
     return true;

@@ -9,7 +9,8 @@ namespace gw {
 
 class CRawData;
 
-/// A new object with a file's bytes, without name, creator or chain; null when the file cannot be read.
+/// Returns a new object with a file's bytes, without name, creator or chain; null if the file cannot be read.
+/// The bytes of a large file stay in the file, which must not change while the object is in use.
 Ref<CRawData> LoadFileAsRawData(const std::string& path);
 
 /// Wraps a motion file into a Kinetra package. The third and fourth argument go into the info block. False

@@ -36,8 +36,7 @@ CNode* AddNode(CNode& parent, const Vec3& offset)
 {
     CNode* child = new CNode;
     child->m_kMatrix.SetTranslation(offset);
-    // One slot a child, as files have it.
-    parent.SetChildAt(parent.GetChildCount(), child);
+    parent.AttachChild(child); // leaves a spare slot after every other child
     return child;
 }
 

@@ -64,6 +64,21 @@ TEST(ControlFile, EveryClassHasItsFieldsInTheOrderOfTheFile)
     EXPECT_EQ(byPoint->Points()[0].m_kEntries[0].m_fWeight, 0.25f);
     EXPECT_EQ(byPoint->Points()[0].m_kEntries[0].m_kOffset, Moved(4, 5, 6));
 
+    CSceneBytes mixed = Scene();
+    const auto point = [&](uint32_t index, float weight) {
+        mixed.Words({index, 1, 0}).Float(weight).Add(kMat4Identity);
+    };
+    Control(mixed, "CSkinBoneControl").Word(3);
+    point(8, 1);
+    point(2, 2);
+    point(8, 3);
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, mixed.Bytes()));
+    const auto& sorted = static_cast<const CSkinBoneControl&>(*stream.GetRoot(0)).Points();
+    ASSERT_EQ(sorted.size(), 2u) << "one record per point";
+    EXPECT_EQ(sorted[0].m_uiIndex, 2u);
+    EXPECT_EQ(sorted[1].m_kEntries[1].m_fWeight, 3.0f);
+
     const auto particles = LoadControl<CParticleControl>([](auto& b) {
         b.Word(100);
         for (float value = 1; value < 38; ++value)

@@ -104,6 +104,60 @@ TEST_F(Skin, OffsetsTakeTheModelToTheBoneAndTheFirstOneStays)
     ExpectPoint(Point(0), {1, 10, 0});
 }
 
+TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
+{
+    m_kMesh->SetPointCount(8);
+    m_kMesh->UpdateScene(0.0f, false);
+    CBoneSkinControl& skin = Attach<CBoneSkinControl>({});
+    const struct
+    {
+        CNode* bone;
+        uint32_t point;
+        float weight;
+    } influences[] = {
+        {m_kA.Get(), 6, 0.5f },
+        {m_kA.Get(), 2, 0.25f},
+        {m_kA.Get(), 3, 1.0f },
+        {m_kA.Get(), 9, 1.0f }, // no such point
+        {m_kB.Get(), 6, 2.0f },
+        {m_kB.Get(), 4, 0.0f }, // acts on nothing
+        {m_kB.Get(), 6, 3.0f },
+    };
+    for (const auto& influence : influences)
+        skin.AddInfluence(*influence.bone, influence.point, influence.weight, kMat4Identity);
+    skin.RebuildSkinTables();
+    std::vector<uint32_t> points;
+    for (const CSkinPointRecord& record : skin.Points())
+        points.push_back(record.point);
+    EXPECT_EQ(points, (std::vector<uint32_t>{2, 3, 6}));
+    EXPECT_TRUE(std::ranges::equal(skin.Points()[2].bones,
+                                   std::vector<CSpatial*>{m_kA.Get(), m_kB.Get(), m_kB.Get()}));
+    EXPECT_TRUE(std::ranges::equal(skin.Points()[2].weights, std::vector{0.5f, 3.0f, 2.0f}));
+    std::vector<std::vector<uint32_t>> groups;
+    for (const auto& row : skin.Groups())
+    {
+        groups.emplace_back();
+        for (const CSkinPointRun& run : row)
+        {
+            for (uint32_t point = run.begin; point < run.end; ++point)
+                groups.back().push_back(point);
+        }
+    }
+    EXPECT_EQ(groups, (std::vector<std::vector<uint32_t>>{
+                          {0,                           1, 4, 5, 7},
+                          {2,                          3},
+                          {                          },
+                          {6}
+    }));
+    m_kMesh->SetPointCount(3);
+    Update();
+    EXPECT_EQ(skin.Points().size(), 1u) << "made again for another number of points";
+    const Ref<CBoneSkinControl> alone = &skin;
+    m_kMesh->DetachControls();
+    skin.RebuildSkinTables();
+    EXPECT_EQ(skin.Groups().size(), 1u);
+}
+
 TEST_F(Skin, ASecondSkinStartsFromTheWorld)
 {
     Attach<CBoneSkinControl>({
@@ -125,7 +179,9 @@ TEST_F(Skin, ByPointAPlaceIsTheSumOfItsBonesAndOthersCollapse)
             {m_kB.Get(), 0.5f}
     },
         Moved(0, 0, 8));
-    skin.AddInfluence(*m_kA, 9, 1.0f, kMat4Identity); // no such point
+    for (const uint32_t point : {9u, 4u}) // no such points
+        skin.AddInfluence(*m_kA, point, 1.0f, kMat4Identity);
+    EXPECT_EQ(skin.Points()[1].m_uiIndex, 4u) << "in ascending order";
     const uint32_t stamp = m_kMesh->m_uiChangeStamp;
     Update();
     ExpectPoint(Point(0), {51, 0, 58});

@@ -1,4 +1,5 @@
 #include "CNode.h"
+#include "FailingAllocations.h"
 #include "MeshSamples.h"
 #include "SceneBytes.h"
 #include "SceneSamples.h"
@@ -108,6 +109,34 @@ TEST(CTriMesh, SizingBelowOneKeepsWhatThereIs)
     EXPECT_TRUE(mesh->m_apkUVWMap.empty());
     EXPECT_TRUE(mesh->SetPointCount(3));
     EXPECT_TRUE(SurvivesRewriting(stream)) << "material ids are as many as points, or none";
+}
+
+TEST(CTriMesh, SizingWithoutMemoryKeepsWhatThereIs)
+{
+    const auto setters = {
+        +[](CTriMesh& mesh) { return mesh.SetPointCount(99); },
+        +[](CTriMesh& mesh) { return mesh.SetNormalCount(99); },
+        +[](CTriMesh& mesh) { return mesh.SetColorCount(99); },
+        +[](CTriMesh& mesh) { return mesh.SetTriangleQuantity(99); },
+        +[](CTriMesh& mesh) { return mesh.m_apkUVWMap[0]->SetUVWCount(99); },
+    };
+    for (const auto set : setters)
+    {
+        const Ref<CTriMesh> mesh = FullMesh();
+        COrrinStream stream;
+        stream.AddRoot(mesh.Get());
+        const std::string before = Describe(stream);
+        int failed = 0;
+        for (bool sized = false; !sized; ++failed)
+        {
+            EXPECT_EQ(Describe(stream), before);
+            g_iAllocationsLeft = failed;
+            sized = set(*mesh);
+            g_iAllocationsLeft = -1;
+        }
+        EXPECT_GT(failed, 1) << "some allocation failed";
+        EXPECT_NE(Describe(stream), before);
+    }
 }
 
 TEST(WorldNormals, AreWeightedByAreaAndZeroWhereOnlyFlatTrianglesMeet)

@@ -112,6 +112,12 @@ TEST(CPackageFile, PiecesMakeThePackageOfTheWholeMotion)
         EXPECT_TRUE(package.Commit());
         EXPECT_EQ(ReadBytes(folder.Path("pieces")), ReadBytes(folder.Path("whole")));
     }
+    Ref<CRawData> block = LoadFileAsRawData(folder.Path("a.htr"));
+    ASSERT_TRUE(block);
+    CCloneMap map;
+    const Ref<CRawData> copy = static_cast<CRawData*>(block->Clone(map));
+    block = nullptr; // the copy shares its bytes
+    EXPECT_TRUE(std::ranges::equal(copy->Data(), std::as_bytes(std::span(motion))));
 }
 
 TEST(CPackageFile, WhatIsNotCommittedOrTooLargeLeavesTheOldFile)
@@ -329,6 +335,8 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
         EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), row.whole);
         EXPECT_EQ(loaded.GetRootCount(), row.whole ? 1u : 0u);
         EXPECT_TRUE(loaded.Thumbnail().m_kPixels.empty());
+        EXPECT_TRUE(loaded.LoadThumbnailOnly(bytes.Bytes(), 0));
+        EXPECT_EQ(loaded.Thumbnail().m_kPixels.size(), 16u) << "after a failure too";
     }
 }
 

@@ -1,5 +1,6 @@
 #include "CCamera.h"
 #include "CCustomData.h"
+#include "CHTMLDump.h"
 #include "CLight.h"
 #include "COrnHTMLPage.h"
 #include "HTMLMarkup.h"
@@ -14,6 +15,10 @@
 #include <cfloat>
 #include <filesystem>
 #include <limits>
+#include <set>
+#include <tuple>
+
+#include <sys/stat.h>
 
 namespace gw {
 namespace {
@@ -155,7 +160,7 @@ TEST_F(HTMLDump, CustomDataHasNoTableAndAnObjectThatIsNoNodeNoSite)
     EXPECT_EQ(Page("data.htm"), "");
 }
 
-TEST_F(HTMLDump, SharedObjectsHaveOnePageAndRingsComeToAnEnd)
+TEST_F(HTMLDump, SharedObjectsHaveOnePageAndAnEntryAtEachPlace)
 {
     const Ref<CNode> root = Node("root");
     const Ref<CNode> shared = Node("shared");
@@ -163,13 +168,58 @@ TEST_F(HTMLDump, SharedObjectsHaveOnePageAndRingsComeToAnEnd)
     for (CNode* child : {shared.Get(), other.Get(), shared.Get()})
         root->AttachChild(child);
     other->AttachChild(shared.Get());
-    shared->AttachChild(root.Get());
-    root->WriteHTMLFrames(m_kFolder.Path());
-    EXPECT_EQ(FileCount(), 5u);
-    const std::string tree = Page("TreeView.htm");
-    const std::string entry = "gFld(\"shared\"";
-    EXPECT_EQ(tree.find(entry), tree.rfind(entry)) << "at the first of its places";
+    shared->AttachChild(root.Get()); // a ring
+    CHTMLDump dump(m_kFolder.Path());
+    dump.WriteSite(*root);
+    dump.WriteSite(*other);
+    EXPECT_EQ(FileCount(), 7u);
+    const auto script = [&](const CNode& top,
+                            const std::vector<std::pair<const CNode*, const CNode*>>& below) {
+        const auto folder = [](const CNode& node) {
+            return "gFld(\"" + std::string(node.NameView()) + "\", \"OrnHTML" + ID(node) +
+                   ".htm target=mainFrame\")";
+        };
+        std::set<const CNode*> named{&top};
+        std::string text = "<!--\nNode" + ID(top) + " = " + folder(top) + ";\n";
+        for (const auto& [parent, node] : below)
+            text += (named.insert(node).second ? "Node" + ID(*node) + " = " : "") + "insFld(Node" +
+                    ID(*parent) + ", " + folder(*node) + ");\n";
+        return text + "initializeDocument(Node" + ID(top) + ")\n-->";
+    };
+    const auto [r, s, o] = std::tuple(root.Get(), shared.Get(), other.Get());
+    EXPECT_THAT(Page("TreeView.htm"), HasSubstr(script(*r, {
+                                                               {r, s},
+                                                               {r, o},
+                                                               {r, s},
+                                                               {s, r},
+                                                               {o, s}
+    })));
+    EXPECT_THAT(Page("TreeView2.htm"), HasSubstr(script(*o, {
+                                                                {o, s},
+                                                                {s, r},
+                                                                {r, s},
+                                                                {r, o},
+                                                                {r, s}
+    })));
     shared->DetachChild(root.Get());
+}
+
+TEST_F(HTMLDump, TreesOfManyRootsStayWithinALimit)
+{
+    constexpr size_t kWidth = 1200; // squared, more than the limit
+    const Ref<CNode> shared = Node("shared");
+    std::vector<Ref<CNode>> roots(kWidth);
+    for (auto& root : roots)
+    {
+        shared->AttachChild(new CNode);
+        root = Node("root");
+        root->AttachChild(shared.Get());
+    }
+    CHTMLDump dump(m_kFolder.Path("no folder/")); // counting its pages is enough
+    for (const auto& root : roots)
+        dump.WriteSite(*root);
+    EXPECT_EQ(dump.PageCount(), 4 * kWidth + 1);
+    EXPECT_LT(dump.EntryCount(), CHTMLDump::kEntryLimit + 3 * kWidth);
 }
 
 TEST_F(HTMLDump, NoTreeIsTooDeep)
@@ -182,13 +232,38 @@ TEST_F(HTMLDump, NoTreeIsTooDeep)
         nodes.push_back(new CNode);
         nodes[nodes.size() - 2]->AttachChild(nodes.back().Get());
     }
-    root->WriteHTMLFrames(m_kFolder.Path());
-    EXPECT_EQ(FileCount(), kLevels + 3u);
+    CHTMLDump dump(m_kFolder.Path("no folder/"));
+    dump.WriteSite(*root);
+    EXPECT_EQ(dump.PageCount(), kLevels + 3u);
     while (nodes.size() > 1) // from below, so that they do not die one within the other
     {
         nodes[nodes.size() - 2]->DetachChild(nodes.back().Get());
         nodes.pop_back();
     }
+}
+
+TEST_F(HTMLDump, AClassMayAddToItsOwnPage)
+{
+    class COwnPage : public CNode
+    {
+    public:
+        void DumpHTML(const std::string& folder, COrnHTMLWriter& page) override
+        {
+            CNode::DumpHTML(folder, page);
+            page.AddLine("own line");
+        }
+    };
+    const Ref<CNode> root = Node("root");
+    const Ref<CNode> child = new COwnPage;
+    child->AttachChild(Node("grandchild").Get());
+    root->AttachChild(child.Get());
+    root->WriteHTMLFrames(m_kFolder.Path());
+    EXPECT_THAT(PageOf(*child), testing::EndsWith("</CAPTION></TABLE>\nown line\n"));
+    EXPECT_EQ(FileCount(), 5u);
+    COrnHTMLWriter page;
+    child->DumpHTML(m_kFolder.Path("no folder/"), page);
+    ASSERT_TRUE(page.SaveAs(m_kFolder.Path("page.htm")));
+    EXPECT_EQ(kHTMLCodePage + ("\n" + Page("page.htm")), PageOf(*child));
 }
 
 TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
@@ -205,7 +280,12 @@ TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
     EXPECT_THAT(PageOf(*root), HasSubstr("root"));
 
     COrnHTMLPage page;
-    EXPECT_FALSE(page.SaveAs(m_kFolder.Path("Index.htm")));
+    WriteBytes(m_kFolder.Path("elsewhere"), "kept");
+    std::filesystem::create_symlink("elsewhere", m_kFolder.Path("link.htm"));
+    ASSERT_EQ(mkfifo(m_kFolder.Path("pipe.htm").c_str(), 0600), 0);
+    for (const char* name : {"Index.htm", "link.htm", "pipe.htm"}) // the last would wait for a reader
+        EXPECT_FALSE(page.SaveAs(m_kFolder.Path(name))) << name;
+    EXPECT_EQ(Page("elsewhere"), "kept");
     EXPECT_TRUE(page.SaveAsText(m_kFolder.Path("page.htm").c_str()));
     root->WriteHTMLFrames(m_kFolder.Path("no folder/"));
     EXPECT_FALSE(FolderExists(m_kFolder.Path("no folder")));
@@ -232,17 +312,19 @@ TEST(HTMLText, NamesAreNoMarkupAndNoScript)
         std::string_view page;
         std::string_view script;
     } rows[] = {
-        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"     },
-        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\\"'"   },
-        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\\\\\\"b\\r\\n"},
+        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"              },
+        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\x22'"           },
+        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\x5c\\x22b\\x0d\\x0a"   },
+        {"control bytes",                         "\x1b\x7f",               "\x1b&#127;",              "\\x1b\\x7f"               },
         {"two, three and four bytes of UTF-8",    "\u00fc\u6771\U0001f9b4", "&#252;&#26481;&#129460;",
-         "\\u{fc}\\u{6771}\\u{1f9b4}"                                                                                    },
-        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\xa5\x5c\\\""    },
-        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\x81\\\\\\\""    },
-        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\xa5\\x3c"       },
-        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\xc0\xbc"        },
-        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\xed\xa0\x80"    },
-        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\u6771\xe6\x9d"  },
+         "\\xfc\\u{6771}\\u{1f9b4}"                                                                                               },
+        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\\u{529f}\\x22"           },
+        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\\x81\\x5c\\x22"          },
+        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\\xa5\\x3c"               },
+        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\\u{64d8}"                },
+        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\\xed\\xa0\\x80"          },
+        {"beyond the last character",             "\xf4\x90\x80\x80",       "\xf4\x90\x80\x80",        "\\xf4\\x90\\x80\\x80"     },
+        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\\xe6\\x9d\\xb1\\xe6\\x9d"},
     };
     for (const auto& row : rows)
     {

@@ -86,6 +86,18 @@ TEST(CObject, UpdateWalksControlsModifiersAndCustomData)
     EXPECT_EQ(behind->m_iUpdates, 0);
 }
 
+TEST(CObject, NothingIsAttachedAfterAHeadThatIsNotAModifier)
+{
+    const Ref<CNode> node = new CNode;
+    const Ref<CTestControl> head = new CTestControl;
+    const Ref<CTestModifier> modifier = new CTestModifier;
+    EXPECT_TRUE(node->AttachModifier(head.Get()));
+    EXPECT_FALSE(node->AttachModifier(modifier.Get()));
+    EXPECT_EQ(modifier->GetTarget(), nullptr);
+    EXPECT_EQ(modifier->GetRefCount(), 1u);
+    EXPECT_TRUE(Ref<CNode>(new CNode)->AttachModifier(modifier.Get())) << "it is free for another object";
+}
+
 TEST(CObject, SecondCustomDataIsRefusedWhereTheControlsEndInNone)
 {
     const Ref<CNode> node = new CNode;
@@ -179,12 +191,19 @@ TEST(Clone, ModifiersAndRenderStatesComeAlongABareCopyHasNothing)
     const Ref<CNode> node = new CNode;
     node->SetName("n");
     node->AttachModifier(new CTestModifier);
-    node->AttachRenderState(*new CTestState(2));
+    for (const size_t type : {2, 5, 1})
+        node->AttachRenderState(*new CTestState(type));
     CCloneMap map;
     const Ref<CNode> copy = static_cast<CNode*>(node->Clone(map));
     ASSERT_NE(copy->GetModifier(), nullptr);
     EXPECT_EQ(static_cast<CModifier*>(copy->GetModifier())->GetTarget(), copy.Get());
-    EXPECT_EQ(copy->HeldObjects().size(), 2u);
+    std::vector<size_t> types;
+    for (CObject* held : copy->HeldObjects())
+    {
+        if (const auto* state = RecordCast<CRenderState>(held))
+            types.push_back(state->GetType());
+    }
+    EXPECT_EQ(types, (std::vector<size_t>{2, 5, 1})) << "attached one by one, each at the front";
     const Ref<CNode> bare = static_cast<CNode*>(node->CreateClone());
     EXPECT_EQ(bare->NameView(), "n");
     EXPECT_TRUE(bare->HeldObjects().empty());
