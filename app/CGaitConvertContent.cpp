@@ -166,7 +166,7 @@ void CGaitConvertContent::ShowSource()
     SetScene(m_pkSourceView.get(), root,
              m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
     LoadMotion(m_kBaseMotion, BaseFile());
-    m_bResultIsFresh = m_kResultMotion.Load(BaseFile());
+    LoadResult();
     if (m_pkProfile)
     {
         m_pkProfile->SetSourceScene(root);

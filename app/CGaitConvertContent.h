@@ -7,6 +7,7 @@
 #include "CProfileOwner.h"
 #include "CResourceManager.h"
 #include "CRetargeter.h"
+#include "FileStamp.h"
 
 #include <cstdint>
 #include <functional>
@@ -194,7 +195,8 @@ private:
 
     // ConvertMotion.cpp
     SourceTiming ConversionTiming() const;
-    void TakeFreshResult();
+    void LoadResult();
+    void ReloadResult();
     bool PrepareRetargeter();
     bool PrepareSource(const SourceTiming& timing);
     void Retarget(const SourceTiming& timing, bool useLegs);
@@ -256,10 +258,10 @@ private:
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
-    std::string m_kSourcePath;                ///< of the file that was opened last
-    CMotionFile m_kBaseMotion;                ///< base.htr as it is, for the editor's target tree
-    CMotionFile m_kResultMotion;              ///< base.htr again, into which the motion is baked
-    bool m_bResultIsFresh = false;            ///< nothing was baked into it, nor was it posed
+    std::string m_kSourcePath;               ///< of the file that was opened last
+    CMotionFile m_kBaseMotion;               ///< base.htr as it is, for the editor's target tree
+    CMotionFile m_kResultMotion;             ///< base.htr again, into which the motion is baked
+    std::optional<FileStamp> m_kResultStamp; ///< of base.htr as read; null once the result was baked or posed
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
