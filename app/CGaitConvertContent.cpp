@@ -103,6 +103,7 @@ int CGaitConvertContent::Open(const std::string& path)
     if (!LoadSource(path))
     {
         ReportFindings(path);
+    ForgetFailedSave();
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
         return 0;
     }

@@ -187,6 +187,7 @@ private:
     void ShowTitle(const std::string& text);
     void RememberFolder(const std::string& path);
     std::string BaseFile() { return ExeFile("base.htr"); }
+    void ForgetFailedSave();
     void Report(const std::string& path, const CFailureRecord& record);
 
     // AlignSource.cpp

@@ -41,6 +41,7 @@ void RebuildRows(Mat4& matrix)
 int CGaitConvertContent::ConvertMotion()
 {
     const CWaitCursor wait(m_kWindow);
+    ForgetFailedSave();
     ForViews(&CMotionView::Stop);
     ReloadResult();
     if (m_pkProfile)

@@ -51,7 +51,7 @@ constexpr Entry kStrings[] = {
     {168, "X"                                                                    },
     {169, "Y"                                                                    },
     {170, "Z"                                                                    },
-    {171, "The motion file has been saved. Do you want to see it in its folder?" },
+    {171, "Show the file in its folder?"                                         },
 };
 
 } // namespace
