@@ -1,11 +1,13 @@
 #include "CGaitConvertContent.h"
 
 #include "AttachBoneMeshes.h"
+#include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CPlatform.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "FailureWords.h"
+#include "Numbers.h"
 #include "Paths.h"
 #include "SourceTiming.h"
 #include "StringTable.h"
@@ -44,6 +46,9 @@ bool CGaitConvertContent::OnInitContent()
 {
     m_pkSourceView = m_kWindow.CreateView("#cnt1");
     m_pkResultView = m_kWindow.CreateView("#cnt2");
+    const int fontSize = ParseInt(Message(kListFontSizeMessage));
+    m_pkProfileCombo = &m_kWindow.CreateComboEx("#format", "pull", fontSize);
+    m_pkProfileCombo->SetFont(Message(kListFontMessage), fontSize, fontSize);
     RefreshProfileList();
     m_pkProfileDialog = std::make_unique<CProfileEditorDialog>(*this);
     m_pkProfileDialog->SetNamesInUse(&m_kProfileNames);

@@ -21,6 +21,7 @@
 namespace gw {
 
 class CBoneMapProfile;
+class CCntComboExControl;
 class CContentWindow;
 class CPlatform;
 class CProfileEditorDialog;
@@ -71,8 +72,8 @@ public:
     CGaitConvertContent(const CGaitConvertContent&) = delete;
     CGaitConvertContent& operator=(const CGaitConvertContent&) = delete;
 
-    /// Makes views, profile list and profile editor. False when the window gave no view; all else works
-    /// without one.
+    /// Makes the views, the profile list and the profile editor; call it once, before everything else. False
+    /// if the window has no view; the rest works without one.
     bool OnInitContent();
 
     // The workflow
@@ -186,8 +187,8 @@ private:
     std::string SourceFolder() const;
     void ShowTitle(const std::string& text);
     void RememberFolder(const std::string& path);
-    std::string BaseFile() { return ExeFile("base.htr"); }
     void ForgetFailedSave();
+    std::string BaseFile() { return ExeFile("base.htr"); }
     void Report(const std::string& path, const CFailureRecord& record);
 
     // AlignSource.cpp
@@ -246,7 +247,7 @@ private:
     void ToggleProfileEditor();
 
     // ProfileList.cpp
-    void AddProfiles(const std::string& folder, int userData);
+    std::string AddProfile(const std::string& path, int userData);
     void ChooseProfile();
     void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);
@@ -266,9 +267,12 @@ private:
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
-    std::string m_kProfilePath;               ///< of the profile selected in the list; empty means none
-    std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
-    std::string m_kTitle;                     ///< what SetTitle was given last
+    std::string m_kProfilePath;      ///< of the profile selected in the list; empty means none
+    std::string m_kPoserProfileName; ///< display name of PoserBVH.prf when the list was last filled
+    std::string m_kMaxProfileName;   ///< the same of MaxBVH.prf
+    CCntComboExControl* m_pkProfileCombo = nullptr; ///< the profile list, which the window owns
+    std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
+    std::string m_kTitle;                           ///< what SetTitle was given last
     ConversionChoices m_kChoices;
     Ref<CNode> m_spkAligned; ///< what the retargeter reads in the source's place; null for the source itself
     AlignReport m_kAlignReport;

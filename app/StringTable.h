@@ -12,6 +12,8 @@ enum EMessage : int
     kAboutToolMessage = 101,
     kTitleMessage = 128,
     kHostKeyMessage = 131,
+    kListFontMessage = 129,     ///< the family of the profile list's font
+    kListFontSizeMessage = 130, ///< its size in tenths of a point
     kHostProgramMessage = 135,
     kNoHostMessage = 137,
     kInvalidSourceMessage = 138,

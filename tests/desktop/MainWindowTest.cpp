@@ -395,3 +395,4 @@ TEST(MainWindow, EveryChildHasANameAndFitsItsText)
 }
 
 } // namespace gw
+    EXPECT_EQ(person.Child("#format")->font().family(), QStringLiteral("Arial"));

@@ -3,7 +3,6 @@
 #include "CGLView.h"
 #include "CGaitConvertContent.h"
 #include "CLeftKeys.h"
-#include "CMessageBox.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
 #include "CProfileEditorWindow.h"
@@ -231,6 +230,13 @@ std::unique_ptr<CMotionView> CContent::CreateView(std::string_view child)
 {
     auto* const surface = Child<CPreviewWidget>(child);
     return surface ? surface->MakeView() : nullptr;
+CCntComboExControl& CContent::CreateComboEx(std::string_view field, std::string_view arrow, int fontSize)
+{
+    m_kCombo.SetChildren(Child<QComboBox>(field), Child<QAbstractButton>(arrow), fontSize);
+    m_kCombo.SetNotify([this](int code) { m_pkLogic->OnCntCommand(code); });
+    return m_kCombo;
+}
+
 }
 
 // Ticks that come in the midst of an operation are lost, as if it had kept the program from its events.

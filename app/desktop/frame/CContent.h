@@ -64,7 +64,7 @@ public:
     void SetChildScrollValue(std::string_view child, int value) override;
     void SetChildText(std::string_view child, const std::string& text) override;
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
-    CCntComboExControl& ProfileCombo() override { return m_kCombo; }
+    CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow, int fontSize) override;
     void SetTimer(int id, int milliseconds) override;
     void KillTimer(int id) override;
     void ShowProfileEditor(bool visible) override;
