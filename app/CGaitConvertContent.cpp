@@ -103,12 +103,12 @@ int CGaitConvertContent::Open(const std::string& path)
 {
     m_kWindow.RedrawFrame();
     const CWaitCursor wait(m_kWindow);
+    ForgetFailedSave();
     if (m_pkSourceView)
         m_pkSourceView->Stop();
     if (!LoadSource(path))
     {
         ReportFindings(path);
-    ForgetFailedSave();
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
         return 0;
     }

@@ -62,6 +62,13 @@ std::string_view BuiltInString(int id)
     return found != std::end(kStrings) && found->m_iID == id ? found->m_kText : std::string_view();
 }
 
+bool EndsStep(int id)
+{
+    constexpr int kEnds[] = {kInvalidSourceMessage, kCannotConvertMessage, kConvertedMessage,
+                             kPackagedMessage,      kShowFileMessage,      kOwnMessage};
+    return std::ranges::find(kEnds, id) != std::end(kEnds);
+}
+
 std::string FormatText(std::string_view format, std::span<const std::string> arguments)
 {
     std::string text;
