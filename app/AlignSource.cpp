@@ -55,7 +55,7 @@ int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
 bool CGaitConvertContent::AlignSource(const SourceTiming& timing, EAlignedJoints joints)
 {
     CNode& target = *m_kResultMotion.motionRoot;
-    m_bResultIsFresh = false;
+    m_kResultStamp.reset();
     CFailureRecord record;
     BodyMotion source{SourceRoot(), timing.frequency, FramesOf(timing, *SourceRoot(), record),
                       BodyOfTable(*m_kRetargeter, target)};

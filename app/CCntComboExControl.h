@@ -21,6 +21,9 @@ public:
     /// The text of an entry, valid until the list changes; null for an index out of range.
     virtual const std::string* GetItemText(int index) const = 0;
     virtual int GetItemUserData(int index) const = 0;
+    /// The font of the field and of the open list: a family, and the size of each in tenths of a point. A
+    /// size of 0 or below leaves the size as it is. Does nothing if no text is shown.
+    virtual void SetFont(const std::string&, int, int) {}
 };
 
 /// The list by itself, with nothing on a screen. A window may show it after every change.

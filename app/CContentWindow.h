@@ -90,8 +90,10 @@ public:
     virtual void SetChildText(std::string_view, const std::string&) {}
     /// The view inside an image child, or null where there is none.
     virtual std::unique_ptr<CMotionView> CreateView(std::string_view) { return nullptr; }
-    /// The list of profiles, which the window owns.
-    virtual CCntComboExControl& ProfileCombo() = 0;
+    /// Makes the list of profiles on two children, a field and an arrow, with a font size in tenths of a
+    /// point. The window owns the list; choices by hand go to OnCntCommand.
+    virtual CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow,
+                                              int fontSize) = 0;
     /// Ticks until it is killed; setting a timer that runs sets its period anew.
     virtual void SetTimer(int, int) {}
     virtual void KillTimer(int) {}

@@ -1,11 +1,13 @@
 #include "CGaitConvertContent.h"
 
 #include "AttachBoneMeshes.h"
+#include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CPlatform.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "FailureWords.h"
+#include "Numbers.h"
 #include "Paths.h"
 #include "SourceTiming.h"
 #include "StringTable.h"
@@ -44,6 +46,9 @@ bool CGaitConvertContent::OnInitContent()
 {
     m_pkSourceView = m_kWindow.CreateView("#cnt1");
     m_pkResultView = m_kWindow.CreateView("#cnt2");
+    const int fontSize = ParseInt(Message(kListFontSizeMessage));
+    m_pkProfileCombo = &m_kWindow.CreateComboEx("#format", "pull", fontSize);
+    m_pkProfileCombo->SetFont(Message(kListFontMessage), fontSize, fontSize);
     RefreshProfileList();
     m_pkProfileDialog = std::make_unique<CProfileEditorDialog>(*this);
     m_pkProfileDialog->SetNamesInUse(&m_kProfileNames);
@@ -98,6 +103,7 @@ int CGaitConvertContent::Open(const std::string& path)
 {
     m_kWindow.RedrawFrame();
     const CWaitCursor wait(m_kWindow);
+    ForgetFailedSave();
     if (m_pkSourceView)
         m_pkSourceView->Stop();
     if (!LoadSource(path))
@@ -166,7 +172,7 @@ void CGaitConvertContent::ShowSource()
     SetScene(m_pkSourceView.get(), root,
              m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
     LoadMotion(m_kBaseMotion, BaseFile());
-    m_bResultIsFresh = m_kResultMotion.Load(BaseFile());
+    LoadResult();
     if (m_pkProfile)
     {
         m_pkProfile->SetSourceScene(root);

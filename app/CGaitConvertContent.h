@@ -7,6 +7,7 @@
 #include "CProfileOwner.h"
 #include "CResourceManager.h"
 #include "CRetargeter.h"
+#include "FileStamp.h"
 
 #include <cstdint>
 #include <functional>
@@ -20,6 +21,7 @@
 namespace gw {
 
 class CBoneMapProfile;
+class CCntComboExControl;
 class CContentWindow;
 class CPlatform;
 class CProfileEditorDialog;
@@ -70,8 +72,8 @@ public:
     CGaitConvertContent(const CGaitConvertContent&) = delete;
     CGaitConvertContent& operator=(const CGaitConvertContent&) = delete;
 
-    /// Makes views, profile list and profile editor. False when the window gave no view; all else works
-    /// without one.
+    /// Makes the views, the profile list and the profile editor; call it once, before everything else. False
+    /// if the window has no view; the rest works without one.
     bool OnInitContent();
 
     // The workflow
@@ -185,6 +187,7 @@ private:
     std::string SourceFolder() const;
     void ShowTitle(const std::string& text);
     void RememberFolder(const std::string& path);
+    void ForgetFailedSave();
     std::string BaseFile() { return ExeFile("base.htr"); }
     void Report(const std::string& path, const CFailureRecord& record);
 
@@ -194,7 +197,8 @@ private:
 
     // ConvertMotion.cpp
     SourceTiming ConversionTiming() const;
-    void TakeFreshResult();
+    void LoadResult();
+    void ReloadResult();
     bool PrepareRetargeter();
     bool PrepareSource(const SourceTiming& timing);
     void Retarget(const SourceTiming& timing, bool useLegs);
@@ -243,7 +247,7 @@ private:
     void ToggleProfileEditor();
 
     // ProfileList.cpp
-    void AddProfiles(const std::string& folder, int userData);
+    std::string AddProfile(const std::string& path, int userData);
     void ChooseProfile();
     void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);
@@ -256,16 +260,19 @@ private:
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
-    std::string m_kSourcePath;                ///< of the file that was opened last
-    CMotionFile m_kBaseMotion;                ///< base.htr as it is, for the editor's target tree
-    CMotionFile m_kResultMotion;              ///< base.htr again, into which the motion is baked
-    bool m_bResultIsFresh = false;            ///< nothing was baked into it, nor was it posed
+    std::string m_kSourcePath;               ///< of the file that was opened last
+    CMotionFile m_kBaseMotion;               ///< base.htr as it is, for the editor's target tree
+    CMotionFile m_kResultMotion;             ///< base.htr again, into which the motion is baked
+    std::optional<FileStamp> m_kResultStamp; ///< of base.htr as read; null once the result was baked or posed
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
-    std::string m_kProfilePath;               ///< of the profile selected in the list; empty means none
-    std::vector<std::string> m_kProfileNames; ///< every name ever listed; grows with each refresh
-    std::string m_kTitle;                     ///< what SetTitle was given last
+    std::string m_kProfilePath;      ///< of the profile selected in the list; empty means none
+    std::string m_kPoserProfileName; ///< display name of PoserBVH.prf when the list was last filled
+    std::string m_kMaxProfileName;   ///< the same of MaxBVH.prf
+    CCntComboExControl* m_pkProfileCombo = nullptr; ///< the profile list, which the window owns
+    std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
+    std::string m_kTitle;                           ///< what SetTitle was given last
     ConversionChoices m_kChoices;
     Ref<CNode> m_spkAligned; ///< what the retargeter reads in the source's place; null for the source itself
     AlignReport m_kAlignReport;

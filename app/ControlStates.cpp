@@ -126,7 +126,7 @@ uint32_t CGaitConvertContent::ControlFacts() const
 
 uint32_t CGaitConvertContent::ProfileFacts() const
 {
-    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const CCntComboExControl& list = *m_pkProfileCombo;
     const int index = list.GetCurSel();
     const std::string* const text = list.GetItemText(index);
     return When(!m_kProfilePath.empty(), kProfilePath) | When(text, kSelection) |

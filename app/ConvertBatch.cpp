@@ -114,7 +114,7 @@ EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::
 // The profile is read from its file again for every source.
 bool CGaitConvertContent::SelectProfileAgain()
 {
-    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const CCntComboExControl& list = *m_pkProfileCombo;
     const std::string* const selected = list.GetItemText(list.GetCurSel());
     if (!selected)
     {

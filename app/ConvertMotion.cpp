@@ -41,8 +41,9 @@ void RebuildRows(Mat4& matrix)
 int CGaitConvertContent::ConvertMotion()
 {
     const CWaitCursor wait(m_kWindow);
+    ForgetFailedSave();
     ForViews(&CMotionView::Stop);
-    TakeFreshResult();
+    ReloadResult();
     if (m_pkProfile)
         m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
     const SourceTiming timing = ConversionTiming();
@@ -60,14 +61,20 @@ int CGaitConvertContent::ConvertMotion()
     return 1;
 }
 
-// A conversion begins with the skeleton as its file has it. What the opening has read is that still, the
-// first time.
-void CGaitConvertContent::TakeFreshResult()
+// The stamp is taken first: a change during the reading makes the next conversion read again.
+void CGaitConvertContent::LoadResult()
 {
-    if (m_bResultIsFresh)
-        Report(BaseFile(), m_kResultMotion.Record());
-    else
-        LoadMotion(m_kResultMotion, BaseFile());
+    const std::optional<FileStamp> stamp = StampOf(BaseFile());
+    m_kResultStamp = m_kResultMotion.Load(BaseFile()) ? stamp : std::nullopt;
+}
+
+// Every conversion starts with the skeleton as its file has it now. The first one after an open need not read
+// the file again, unless it has changed since.
+void CGaitConvertContent::ReloadResult()
+{
+    if (!m_kResultStamp || m_kResultStamp != StampOf(BaseFile()))
+        LoadResult();
+    Report(BaseFile(), m_kResultMotion.Record());
 }
 
 // Fills a retargeter's tables from the profile. It is a new one: tables are keyed by the target's bones, and
@@ -107,7 +114,7 @@ bool CGaitConvertContent::PrepareSource(const SourceTiming& timing)
 
 void CGaitConvertContent::Retarget(const SourceTiming& timing, bool useLegs)
 {
-    m_bResultIsFresh = false;
+    m_kResultStamp.reset();
     m_kRetargeter->SetFaithful(m_kChoices.faithful);
     m_kRetargeter->SetProgress([this](size_t done, size_t total) { ShowProgress(done, total); });
     m_kRetargeter->Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, kRootPosition, true, useLegs);

@@ -43,7 +43,10 @@ public:
         if (child == "convert")
             m_bMayConvert = enabled;
     }
-    CCntComboExControl& ProfileCombo() override { return m_kProfiles; }
+    CCntComboExControl& CreateComboEx(std::string_view, std::string_view, int) override
+    {
+        return m_kProfiles;
+    }
 
 private:
     std::vector<CReport>& m_kReports;

@@ -13,6 +13,7 @@
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "SourceTiming.h"
+#include "StringTable.h"
 #include "SuggestProfile.h"
 #include "Text.h"
 
@@ -74,7 +75,8 @@ int CGaitConvertContent::DraftProfile()
     const SuggestedProfile draft = SuggestProfile(*SourceRoot(), *target);
     if (!draft.missing.empty())
     {
-        m_kWindow.ShowMessageBox(0, "This source has no body that a bone map could be drafted for.",
+        m_kWindow.ShowMessageBox(kOwnMessage,
+                                 "No human body was found in this motion, so no bone map can be drafted.",
                                  EButtons::OK);
         return 0;
     }
@@ -86,7 +88,7 @@ int CGaitConvertContent::DraftProfile()
         !file.Commit())
     {
         m_kWindow.Report(MakeReport(path, {EFailure::WriteError, 0, {}}, false));
-        m_kWindow.ShowMessageBox(0, "The drafted bone map cannot be written.", EButtons::OK);
+        m_kWindow.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
         return 0;
     }
     OpenDraft(name);

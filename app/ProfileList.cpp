@@ -55,19 +55,28 @@ std::string CGaitConvertContent::FindProfilePath(const std::string& name)
 
 void CGaitConvertContent::RefreshProfileList()
 {
-    m_kWindow.ProfileCombo().DeleteItem(-1);
-    AddProfiles(ExeFile({}), kStock);
-    AddProfiles(ProfileFile({}), kCustom);
+    m_pkProfileCombo->DeleteItem(-1);
+    const std::string stock = ExeFile({});
+    for (const std::string& file : FilesInFolder(stock, kProfileExtension))
+    {
+        const std::string name = AddProfile(stock + file, kStock);
+        if (file == kPoserFile)
+            m_kPoserProfileName = name;
+        if (file == kMaxFile)
+            m_kMaxProfileName = name;
+    }
+    const std::string custom = ProfileFile({});
+    for (const std::string& file : FilesInFolder(custom, kProfileExtension))
+        AddProfile(custom + file, kCustom);
 }
 
-void CGaitConvertContent::AddProfiles(const std::string& folder, int userData)
+// Adds a file's display name to the list and to the known names, and returns it.
+std::string CGaitConvertContent::AddProfile(const std::string& path, int userData)
 {
-    for (const std::string& file : FilesInFolder(folder, kProfileExtension))
-    {
-        const std::string name = ReadProfileName(folder + file);
-        m_kWindow.ProfileCombo().AddItem(name, userData);
-        m_kProfileNames.push_back(name);
-    }
+    std::string name = ReadProfileName(path);
+    m_pkProfileCombo->AddItem(name, userData);
+    m_kProfileNames.push_back(name);
+    return name;
 }
 
 bool CGaitConvertContent::IsListed(const std::string& name) const
@@ -79,7 +88,7 @@ bool CGaitConvertContent::IsListed(const std::string& name) const
 // The index moves on after a deletion as well, so that the entry that slid into the place is passed over.
 void CGaitConvertContent::PruneProfileList()
 {
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
     {
         if (!IsListed(*text) && index != list.GetCurSel() && FindProfilePath(*text).empty())
@@ -90,7 +99,7 @@ void CGaitConvertContent::PruneProfileList()
 // Loading refills the list, which is why every text is copied and looked up anew.
 void CGaitConvertContent::SelectProfileByName(const std::string& name)
 {
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
     {
         if (!EqualNoCase(*text, name))
@@ -115,7 +124,7 @@ void CGaitConvertContent::OnCntCommand(int code)
 
 void CGaitConvertContent::ChooseProfile()
 {
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     const int chosen = list.GetCurSel();
     PruneProfileList();
     // The index of before the pruning: an entry that went before the chosen one makes this the next one's
@@ -136,25 +145,24 @@ bool CGaitConvertContent::ProfileFits(const std::string& path)
 
 void CGaitConvertContent::PickStockProfile()
 {
-    const std::string poserName = ReadProfileName(ExeFile(kPoserFile));
     if (ProfileFits(ExeFile(kPoserFile)))
     {
-        SelectProfileByName(poserName);
+        SelectProfileByName(m_kPoserProfileName);
         return;
     }
     if (!ProfileFits(ExeFile(kMaxFile)))
         return;
     // A user's choice outlives an open, unless it is the other stock profile.
-    const CCntComboExControl& list = m_kWindow.ProfileCombo();
+    const CCntComboExControl& list = *m_pkProfileCombo;
     const std::string* const selected = list.GetItemText(list.GetCurSel());
-    if (!selected || EqualNoCase(*selected, poserName))
-        SelectProfileByName(ReadProfileName(ExeFile(kMaxFile)));
+    if (!selected || EqualNoCase(*selected, m_kPoserProfileName))
+        SelectProfileByName(m_kMaxProfileName);
 }
 
 // The profile path goes on naming the deleted file until the next selection.
 void CGaitConvertContent::DeleteSelectedProfile()
 {
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     const int index = list.GetCurSel();
     if (ShowMessage(kRemoveProfileMessage, EButtons::OKCancel) == EAnswer::OK && list.GetItemText(index))
     {
@@ -172,7 +180,7 @@ void CGaitConvertContent::DeleteSelectedProfile()
 
 void CGaitConvertContent::LoadSelectedProfile()
 {
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     list.SetCurSel(list.GetCurSel());
     const std::string* const text = list.GetItemText(list.GetCurSel());
     const std::string path = text ? FindProfilePath(*text) : std::string();
@@ -191,7 +199,7 @@ void CGaitConvertContent::ProfileSetChanged()
     if (!m_pkProfile)
         return;
     RefreshProfileList();
-    CCntComboExControl& list = m_kWindow.ProfileCombo();
+    CCntComboExControl& list = *m_pkProfileCombo;
     std::string name;
     m_pkProfile->GetProfileName(name);
     if (FindItem(list, name) < 0)

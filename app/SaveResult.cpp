@@ -15,6 +15,7 @@ namespace {
 
 constexpr std::string_view kPackageExtension = ".Kinetra";
 constexpr std::string_view kMotionExtension = ".htr";
+constexpr const char* kNotSaved = "not saved: "; // begins the title after a failed save
 // The host plays packages at this rate: a result is stored in half-steps of it.
 constexpr float kSavedRate = 120.0f;
 constexpr float kHostRate = 60.0f;
@@ -28,13 +29,26 @@ int CGaitConvertContent::SaveResult()
         return 1;
     const CWaitCursor wait(m_kWindow);
     WriteResult(*path);
-    m_bSaved = true; // whatever became of the files; the title tells
-    SetTitle(m_kWriteRecord.Failure()
-                 ? "not saved: " + MakeReport(*path, m_kWriteRecord.Failure(), false).words
-                 : std::string());
-    if (ShowMessage(kShowFileMessage, EButtons::OKCancel) == EAnswer::OK)
+    m_bSaved = true; // even if it was not: the title and the box report that
+    std::string title;
+    std::string text = Message(kShowFileMessage);
+    if (m_kWriteRecord.Failure())
+    {
+        const CReport report = MakeReport(*path, m_kWriteRecord.Failure(), false);
+        title = kNotSaved + report.words;
+        text = "Nothing was written.\n" + ReportLine(report) + "\n\n" + text;
+    }
+    SetTitle(title);
+    if (m_kWindow.ShowMessageBox(kShowFileMessage, text, EButtons::OKCancel) == EAnswer::OK)
         m_kWindow.ShowInFileManager(*path);
     return 1;
+}
+
+// The next step ends what the title reports of the last save.
+void CGaitConvertContent::ForgetFailedSave()
+{
+    if (m_kTitle.starts_with(kNotSaved))
+        SetTitle({});
 }
 
 bool CGaitConvertContent::WriteResult(const std::string& path)

@@ -51,7 +51,7 @@ constexpr Entry kStrings[] = {
     {168, "X"                                                                    },
     {169, "Y"                                                                    },
     {170, "Z"                                                                    },
-    {171, "The motion file has been saved. Do you want to see it in its folder?" },
+    {171, "Show the file in its folder?"                                         },
 };
 
 } // namespace
@@ -60,6 +60,13 @@ std::string_view BuiltInString(int id)
 {
     const auto* found = std::ranges::lower_bound(kStrings, id, {}, &Entry::m_iID);
     return found != std::end(kStrings) && found->m_iID == id ? found->m_kText : std::string_view();
+}
+
+bool EndsStep(int id)
+{
+    constexpr int kEnds[] = {kInvalidSourceMessage, kCannotConvertMessage, kConvertedMessage,
+                             kPackagedMessage,      kShowFileMessage,      kOwnMessage};
+    return std::ranges::find(kEnds, id) != std::end(kEnds);
 }
 
 std::string FormatText(std::string_view format, std::span<const std::string> arguments)

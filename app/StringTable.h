@@ -9,8 +9,11 @@ namespace gw {
 /// The messages that the program itself shows, and the texts it looks things up by.
 enum EMessage : int
 {
+    kOwnMessage = 0, ///< a text without an id
     kAboutToolMessage = 101,
     kTitleMessage = 128,
+    kListFontMessage = 129,     ///< the family of the profile list's font
+    kListFontSizeMessage = 130, ///< its size in tenths of a point
     kHostKeyMessage = 131,
     kHostProgramMessage = 135,
     kNoHostMessage = 137,
@@ -31,6 +34,10 @@ enum EMessage : int
 
 /// The program's own text of a message, misspellings and all; empty for an unknown id.
 std::string_view BuiltInString(int id);
+
+/// Whether a message reports how a step ended (an open, a conversion, a save, a batch run), so that its box
+/// also shows what the step reported on the way. Questions in the middle of a step do not.
+bool EndsStep(int id);
 
 /// A text with its %d and %s replaced in order. Formats may come from a translation, so whatever else they
 /// hold is copied, and placeholders without an argument become nothing.

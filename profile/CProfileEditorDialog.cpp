@@ -351,7 +351,9 @@ void CProfileEditorDialog::CommitNumbers(EFieldCommit mode)
 void CProfileEditorDialog::CommitName(EFieldCommit mode)
 {
     const std::string name = m_kFields.ReadName();
-    if (mode != EFieldCommit::Apply || EqualNoCase(name, CutTrailing(m_kProfileName)))
+    // A file can have a longer name than the field gives back; leaving the field does not rename the profile.
+    const std::string_view present = CutTrailing(FirstCharacters(m_kProfileName, kProfileNameLimit));
+    if (mode != EFieldCommit::Apply || EqualNoCase(name, present))
         return;
     if (name.empty() || IsNameInUse(name, m_pkNamesInUse))
     {

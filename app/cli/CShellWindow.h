@@ -39,7 +39,10 @@ public:
     void Report(const CReport& report) override;
     void ShowBatchFile(size_t index, size_t count, const std::string& path) override;
     void EnableChild(std::string_view child, bool enabled) override;
-    CCntComboExControl& ProfileCombo() override { return m_kProfiles; }
+    CCntComboExControl& CreateComboEx(std::string_view, std::string_view, int) override
+    {
+        return m_kProfiles;
+    }
 
 private:
     const COptions& m_kOptions;

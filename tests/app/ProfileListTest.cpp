@@ -86,6 +86,18 @@ TEST_F(ContentTest, StockChoice)
     }
 }
 
+TEST_F(ContentTest, StockNamesAreThoseOfTheLastRefresh)
+{
+    Write("data/PoserBVH.prf", BoneMapText("Renamed", kPoserBones));
+    const std::string walk = Write("walk.bvh", BvhText(kPoserBones));
+    for (const char* name : {"Poser", "Renamed"})
+    {
+        Open(walk);
+        EXPECT_EQ(SelectedProfile(), name);
+        m_kContent.RefreshProfileList();
+    }
+}
+
 TEST_F(ContentTest, DeletingAProfile)
 {
     SelectProfile("Mine");

@@ -92,10 +92,11 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
     {
         const char* what;
         const char* name;
+        const char* next; // step, which ends what the title says
     } rows[] = {
-        {"a read-only package",        "old.Kinetra"     },
-        {"a folder that is not there", "none/out.Kinetra"},
-        {"an HTR in such a folder",    "none/out.htr"    },
+        {"a read-only package",        "old.Kinetra",      "click convert"},
+        {"a folder that is not there", "none/out.Kinetra", "open gone.bvh"},
+        {"an HTR in such a folder",    "none/out.htr",     "open walk.bvh"},
     };
     for (const auto& row : rows)
     {
@@ -105,11 +106,17 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
         EXPECT_EQ(m_kWindow.TakeWords().find("write-error"), 0u);
         EXPECT_EQ(m_kWindow.m_kTitles.back().find("Gaitwright v2.0 - not saved: "), 0u)
             << m_kWindow.m_kTitles.back();
+        EXPECT_EQ(m_kWindow.m_kBoxes.back(), "Nothing was written.\n" + m_kFolder.Path(row.name) +
+                                                 ": the file cannot be written (check free space and "
+                                                 "permissions)\n\nShow the file in its folder?");
+        Do(row.next);
+        EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+        m_kWindow.TakeCalls();
     }
     EXPECT_EQ(Read("old.Kinetra"), "old");
     EXPECT_TRUE(FilesInFolder(m_kFolder.Path(), ".htr").empty()) << "no intermediate file is left";
     SaveAs("good.Kinetra");
-    EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+    EXPECT_EQ(m_kWindow.m_kBoxes.back(), "Show the file in its folder?");
 }
 
 TEST_F(ContentTest, AProfileWithoutAFrameRateWritesNothing)

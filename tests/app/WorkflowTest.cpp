@@ -6,6 +6,8 @@
 #include "FindBone.h"
 #include "Paths.h"
 
+#include <filesystem>
+
 namespace gw {
 
 TEST_F(ContentTest, ControlsFollowTheState)
@@ -206,6 +208,33 @@ TEST_F(ContentTest, ShiftLeavesTheLegsOutAndNothingElse)
     const std::string without = save("without.htr");
     EXPECT_EQ(section(with, "LowerTorso"), section(without, "LowerTorso"));
     EXPECT_NE(section(with, "LThigh"), section(without, "LThigh"));
+}
+
+TEST_F(ContentTest, EveryConversionStartsFromTheTargetAsItIsOnTheDisk)
+{
+    const std::string base = m_kFolder.Path("data/base.htr");
+    std::string text = ReadBytes(base);
+    const size_t offset = text.find("RThigh -95") + 8;
+    Write("walk.bvh", BvhText(kPoserBones));
+    for (const bool isReplaced : {false, true}) // by another file of the same size and time, else in place
+    {
+        SCOPED_TRACE(isReplaced);
+        const std::filesystem::file_time_type before{std::chrono::hours(1)};
+        std::filesystem::last_write_time(base, before);
+        Do("open walk.bvh");
+        text[offset] = isReplaced ? '6' : '7';
+        const std::string written = Write(isReplaced ? "next.htr" : "data/base.htr", text);
+        if (isReplaced)
+            std::filesystem::last_write_time(written, before);
+        std::filesystem::rename(written, base);
+        for (const char* name : {"first.htr", "second.htr"})
+        {
+            m_kContent.ConvertMotion();
+            SaveAs(name);
+        }
+        EXPECT_NE(Read("first.htr").find("RThigh -" + text.substr(offset, 2)), std::string::npos);
+        EXPECT_EQ(Read("first.htr"), Read("second.htr"));
+    }
 }
 
 TEST_F(ContentTest, TheRestPoseStandsWhereTheMotionBegins)

@@ -183,6 +183,7 @@ void CPerson::WillAnswer(const char* button)
         m_kBoxes << (text ? text->accessibleName() : QString());
         const auto* details = dialog.findChild<QPlainTextEdit*>(QStringLiteral("detailsText"));
         m_kDetails = details ? details->toPlainText() : QString();
+        m_bUnfolded = details && details->isVisible();
         QTest::mouseClick(found, Qt::LeftButton);
         return true;
     });

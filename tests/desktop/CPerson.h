@@ -71,7 +71,8 @@ public:
     void WillChooseFolder(const std::string& folder, int filter);
     /// The texts of the message boxes that came up, and how many answers are still to be given.
     QStringList m_kBoxes;
-    QString m_kDetails; ///< of the last one
+    QString m_kDetails;       ///< of the last one
+    bool m_bUnfolded = false; ///< whether they could be seen at once
     size_t AnswersLeft() const { return m_kAnswers.size(); }
 
     /// Lets the program run until something holds; false after five seconds.

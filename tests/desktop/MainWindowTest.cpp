@@ -187,6 +187,33 @@ TEST(MainWindow, AProfileThatDoesNotFitSaysWhy)
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("LeftCollar"));
 }
 
+TEST(MainWindow, NotesStayUntilTheNextStepAndInTheirOwnBoxes)
+{
+    CPerson person;
+    const std::string folder = person.Content().ProfileFile({});
+    WriteBytes(folder + "Custom0.prf", "Mine\nhip <---> LowerTorso 0\n");
+    OpenWalk(person);
+    EXPECT_FALSE(person.Child("notes")->isVisible());
+    person.ChooseProfile(QStringLiteral("Max BVH"));
+    person.WillAnswer("ok");
+    person.Click("convert");
+    const QString notes = person.m_kDetails;
+    person.Drop(folder + "Custom0.prf");
+    person.WillAnswer("cancel");
+    person.Click("del");
+    EXPECT_EQ(person.m_kDetails, QString()) << "not a matter of the profile's removal";
+    for (int time = 0; time < 2; ++time)
+    {
+        person.WillAnswer("ok");
+        person.Click("notes");
+        EXPECT_EQ(person.m_kBoxes.back(), QStringLiteral("Notes on the last step"));
+        EXPECT_EQ(person.m_kDetails, notes);
+        EXPECT_TRUE(person.m_bUnfolded);
+    }
+    OpenWalk(person);
+    EXPECT_FALSE(person.Child("notes")->isVisible());
+}
+
 TEST(MainWindow, ACustomProfileIsDroppedChosenAndDeleted)
 {
     CPerson person;
@@ -381,6 +408,7 @@ TEST(MainWindow, EveryChildHasANameAndFitsItsText)
 {
     CPerson person;
     OpenAndConvert(person);
+    EXPECT_EQ(person.Child("#format")->font().family(), QStringLiteral("Arial"));
     for (const QWidget* child :
          person.Child("face")->findChildren<QWidget*>(QString(), Qt::FindDirectChildrenOnly))
     {

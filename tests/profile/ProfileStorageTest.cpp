@@ -205,11 +205,13 @@ TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
 
 TEST_F(ProfileEditor, NumberedNameStaysWithinTheLimitAndCanBeSaved)
 {
-    const std::string longName(kProfileNameLimit, 'n');
+    const std::string longName(kProfileNameLimit + 6, 'n'); // more than the field takes
     m_kNamesInUse = {longName};
     const std::string path = MakeProfile(longName + "\nA x Head 0\n");
     MakeReadOnly(path);
     m_kEditor.LoadProfile(path);
+    m_kEditor.LeaveField();
+    EXPECT_FALSE(m_kEditor.IsDirty()) << "leaving a field renames nothing";
     SelectBones("B", "Waist");
     m_kEditor.ClickButton(kAddToMapButton);
     m_kEditor.LeaveField();

@@ -3,7 +3,6 @@
 #include "CGLView.h"
 #include "CGaitConvertContent.h"
 #include "CLeftKeys.h"
-#include "CMessageBox.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
 #include "CProfileEditorWindow.h"
@@ -39,9 +38,7 @@ CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : Q
         m_kChildren[child.name] = widget;
         Connect(widget);
     }
-    m_kCombo.SetChildren(Child<QComboBox>("#format"), Child<QAbstractButton>("pull"));
-    m_kCombo.SetNotify([this](int code) { m_pkLogic->OnCntCommand(code); });
-    ShowNotes();
+    ShowNoteCount();
 }
 
 CContent::~CContent() = default;
@@ -82,8 +79,7 @@ void CContent::Click(const std::string& child)
     else if (child == "options")
         m_kOptions(Child<QWidget>(child)->mapToGlobal(QPoint(0, 0)));
     else if (child == "notes")
-        ShowMessageBox(0, ToUtf8(QCoreApplication::translate("Face", "Notes on the last step")),
-                       EButtons::OK);
+        ShowNotes();
     else if (m_pkLogic)
         m_pkLogic->ChildClick(child);
 }
@@ -135,7 +131,7 @@ std::string CContent::Notes() const
     return text;
 }
 
-void CContent::ShowNotes()
+void CContent::ShowNoteCount()
 {
     auto* const button = Child<QPushButton>("notes");
     if (!button)
@@ -161,6 +157,7 @@ void CContent::BeginWaitCursor()
     if (m_iWaits++ > 0)
         return;
     m_kReports.clear();
+    ShowNoteCount();
     m_kSincePainted.start();
     QGuiApplication::setOverrideCursor(Qt::WaitCursor);
 }
@@ -170,7 +167,7 @@ void CContent::EndWaitCursor()
     if (--m_iWaits > 0)
         return;
     QGuiApplication::restoreOverrideCursor();
-    ShowNotes();
+    ShowNoteCount();
 }
 
 void CContent::RedrawFrame()
@@ -231,6 +228,13 @@ std::unique_ptr<CMotionView> CContent::CreateView(std::string_view child)
 {
     auto* const surface = Child<CPreviewWidget>(child);
     return surface ? surface->MakeView() : nullptr;
+}
+
+CCntComboExControl& CContent::CreateComboEx(std::string_view field, std::string_view arrow, int fontSize)
+{
+    m_kCombo.SetChildren(Child<QComboBox>(field), Child<QAbstractButton>(arrow), fontSize);
+    m_kCombo.SetNotify([this](int code) { m_pkLogic->OnCntCommand(code); });
+    return m_kCombo;
 }
 
 // Ticks that come in the midst of an operation are lost, as if it had kept the program from its events.

@@ -64,7 +64,7 @@ public:
     void SetChildScrollValue(std::string_view child, int value) override;
     void SetChildText(std::string_view child, const std::string& text) override;
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
-    CCntComboExControl& ProfileCombo() override { return m_kCombo; }
+    CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow, int fontSize) override;
     void SetTimer(int id, int milliseconds) override;
     void KillTimer(int id) override;
     void ShowProfileEditor(bool visible) override;
@@ -83,6 +83,7 @@ private:
     void Connect(QWidget* child);
     void ConnectBar(QWidget* child);
     void Click(const std::string& child);
+    void ShowNoteCount();
     void ShowNotes();
     std::string Notes() const;
 
@@ -92,7 +93,7 @@ private:
     std::map<std::string, QWidget*, std::less<>> m_kChildren;
     std::map<int, std::unique_ptr<QTimer>> m_kTimers;
     CProfileCombo m_kCombo;
-    std::vector<CReport> m_kReports; ///< of the present or last operation, until they were shown
+    std::vector<CReport> m_kReports; ///< of the present step, or of the last one until the next begins
     QElapsedTimer m_kSincePainted;   ///< within an operation
     int m_iWaits = 0;
 };

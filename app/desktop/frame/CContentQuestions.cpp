@@ -9,6 +9,7 @@
 #include "QtText.h"
 #include "StringTable.h"
 
+#include <QCoreApplication>
 #include <QGuiApplication>
 
 namespace gw {
@@ -27,12 +28,19 @@ public:
 
 } // namespace
 
-EAnswer CContent::ShowMessageBox(int, const std::string& text, EButtons buttons)
+EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons buttons)
 {
     const CArrowCursor arrow;
-    const std::string details = Notes();
-    m_kReports.clear(); // they are shown here
+    // Reports are cleared when a step begins, so outside of one they belong to an earlier step.
+    const std::string details = m_iWaits > 0 && EndsStep(id) ? Notes() : std::string();
     return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, details);
+}
+
+void CContent::ShowNotes()
+{
+    RunMessageBox(this, m_pkLogic->Message(kTitleMessage),
+                  ToUtf8(QCoreApplication::translate("Face", "Notes on the last step")), EButtons::OK,
+                  Notes(), EDetails::Unfolded);
 }
 
 std::optional<std::string> CContent::AskOpenFile(const CFileDialogSetup& setup)

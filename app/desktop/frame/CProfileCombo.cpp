@@ -3,10 +3,28 @@
 #include "QtText.h"
 
 #include <QAbstractButton>
+#include <QAbstractItemView>
 #include <QComboBox>
 #include <QSignalBlocker>
 
 namespace gw {
+
+namespace {
+
+constexpr double kSizesPerPoint = 10.0;
+
+// Where the skin's style sheet sets a size, that one wins.
+void ChangeFont(QWidget& widget, const QString& family, int size)
+{
+    QFont font = widget.font();
+    if (!family.isEmpty())
+        font.setFamily(family);
+    if (size > 0)
+        font.setPointSizeF(size / kSizesPerPoint);
+    widget.setFont(font);
+}
+
+} // namespace
 
 void CProfileCombo::AddItem(const std::string& text, int userData)
 {
@@ -35,9 +53,18 @@ void CProfileCombo::SetCurSel(int index)
     ShowSelection();
 }
 
-void CProfileCombo::SetChildren(QComboBox* field, QAbstractButton* arrow)
+void CProfileCombo::SetFont(const std::string& family, int fieldSize, int listSize)
+{
+    if (!m_kField)
+        return;
+    ChangeFont(*m_kField, ToQString(family), fieldSize);
+    ChangeFont(*m_kField->view(), ToQString(family), listSize);
+}
+
+void CProfileCombo::SetChildren(QComboBox* field, QAbstractButton* arrow, int fontSize)
 {
     m_kField = field;
+    ChangeFont(*field, {}, fontSize);
     for (int index = 0; const std::string* text = GetItemText(index); ++index)
         field->addItem(ToQString(*text));
     ShowSelection();

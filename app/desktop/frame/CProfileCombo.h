@@ -22,8 +22,10 @@ public:
     void DeleteItem(int index) override;
     void SetCurSel(int index) override;
 
-    /// Both may die before this.
-    void SetChildren(QComboBox* field, QAbstractButton* arrow);
+    void SetFont(const std::string& family, int fieldSize, int listSize) override;
+
+    /// Both may die before this. The font size is in tenths of a point.
+    void SetChildren(QComboBox* field, QAbstractButton* arrow, int fontSize);
     /// What a choice by hand calls, after the selection.
     void SetNotify(std::function<void(int code)> notify) { m_kNotify = std::move(notify); }
 

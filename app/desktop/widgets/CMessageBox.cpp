@@ -122,7 +122,7 @@ int WrappedHeight(const QWidget& widget, int width, const QString& text)
 } // namespace
 
 CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
-                         const QString& details)
+                         const QString& details, EDetails shown)
     : QDialog(owner), m_eEscape(RowsOf(buttons).back().answer)
 {
     Named(this, "messageBox", caption);
@@ -140,6 +140,8 @@ CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& 
     if (!details.isEmpty())
         layout->addWidget(MakeDetails(details));
     layout->addLayout(MakeButtons(buttons, !details.isEmpty()));
+    if (m_pkFold && shown == EDetails::Unfolded)
+        m_pkFold->setChecked(true);
 }
 
 QWidget* CMessageBox::MakeText(const QString& text)
@@ -161,6 +163,7 @@ QWidget* CMessageBox::MakeText(const QString& text)
 QWidget* CMessageBox::MakeDetails(const QString& details)
 {
     m_pkDetails = Named(new QPlainTextEdit(details, this), "detailsText", Own("Details"));
+    m_pkDetails->ensurePolished(); // the style sheet may change the font
     m_pkDetails->setReadOnly(true);
     m_pkDetails->setTabChangesFocus(true);
     m_pkDetails->setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
@@ -191,23 +194,23 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
 // To the left of the others, and behind them in the order of the keyboard.
 void CMessageBox::AddDetailsButtons(QBoxLayout& layout)
 {
-    auto* fold = Named(new QToolButton(this), "details", Own("Details"));
-    fold->setText(Own("&Details"));
-    fold->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
-    fold->setArrowType(Qt::RightArrow);
-    fold->setCheckable(true);
-    fold->setFocusPolicy(Qt::StrongFocus);
+    m_pkFold = Named(new QToolButton(this), "details", Own("Details"));
+    m_pkFold->setText(Own("&Details"));
+    m_pkFold->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
+    m_pkFold->setArrowType(Qt::RightArrow);
+    m_pkFold->setCheckable(true);
+    m_pkFold->setFocusPolicy(Qt::StrongFocus);
     auto* copy = Named(new QPushButton(Own("Co&py"), this), "copy", Own("Copy the details"));
     copy->setAutoDefault(false);
     copy->hide();
-    connect(fold, &QToolButton::toggled, this, [this, fold, copy](bool visible) {
-        fold->setArrowType(visible ? Qt::DownArrow : Qt::RightArrow);
+    connect(m_pkFold, &QToolButton::toggled, this, [this, copy](bool visible) {
+        m_pkFold->setArrowType(visible ? Qt::DownArrow : Qt::RightArrow);
         copy->setVisible(visible);
         ShowDetails(visible);
     });
     connect(copy, &QPushButton::clicked, this,
             [this] { QGuiApplication::clipboard()->setText(m_pkDetails->toPlainText()); });
-    layout.insertWidget(0, fold);
+    layout.insertWidget(0, m_pkFold);
     layout.insertWidget(1, copy);
 }
 
@@ -217,8 +220,9 @@ void CMessageBox::ShowDetails(bool visible)
     {
         const int margins = 2 * kDialogMargin;
         const int least = 4 * m_pkDetails->fontMetrics().lineSpacing();
-        const int most =
-            static_cast<int>(kMostOfScreen * screen()->availableSize().height()) - height() - margins;
+        // The hint and not the height, which a box that is not shown yet does not have.
+        const int most = static_cast<int>(kMostOfScreen * screen()->availableSize().height()) -
+                         sizeHint().height() - margins;
         const int wanted =
             WrappedHeight(*m_pkDetails, m_pkDetails->minimumWidth() - margins, m_pkDetails->toPlainText()) +
             margins;
@@ -238,9 +242,9 @@ void CMessageBox::reject()
 }
 
 EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
-                      const std::string& details)
+                      const std::string& details, EDetails shown)
 {
-    CMessageBox box(owner, ToQString(caption), ToQString(text), buttons, ToQString(details));
+    CMessageBox box(owner, ToQString(caption), ToQString(text), buttons, ToQString(details), shown);
     return box.Run();
 }
 

@@ -7,8 +7,16 @@
 
 class QBoxLayout;
 class QPlainTextEdit;
+class QToolButton;
 
 namespace gw {
+
+/// How a message box shows its details at first.
+enum class EDetails
+{
+    Folded,
+    Unfolded,
+};
 
 /// The program's message box: a text, its buttons, and details that fold out under the text. All texts are
 /// plain, whatever is in a file's name. Enter presses the first button; Escape and the close box press the
@@ -17,7 +25,7 @@ class CMessageBox : public QDialog
 {
 public:
     CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
-                const QString& details);
+                const QString& details, EDetails shown = EDetails::Folded);
 
     /// Shows it until it is answered.
     EAnswer Run();
@@ -33,10 +41,11 @@ private:
 
     EAnswer m_eEscape;
     QPlainTextEdit* m_pkDetails = nullptr;
+    QToolButton* m_pkFold = nullptr;
 };
 
 /// Shows a message box until it is answered. Without details there is nothing to fold out.
 EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
-                      const std::string& details = {});
+                      const std::string& details = {}, EDetails shown = EDetails::Folded);
 
 } // namespace gw

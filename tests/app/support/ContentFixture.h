@@ -58,7 +58,7 @@ public:
     void SetChildScrollValue(std::string_view, int value) override { m_iScrollValue = value; }
     void SetChildText(std::string_view child, const std::string& text) override;
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
-    CCntComboExControl& ProfileCombo() override { return m_kList; }
+    CCntComboExControl& CreateComboEx(std::string_view, std::string_view, int) override { return m_kList; }
     void SetTimer(int id, int milliseconds) override;
     void KillTimer(int id) override { m_kCalls.push_back("kill " + std::to_string(id)); }
     void ShowInFileManager(const std::string& path) override { m_kCalls.push_back("show " + path); }

@@ -1,0 +1,25 @@
+#pragma once
+
+#include <cstdint>
+#include <optional>
+#include <string>
+
+namespace gw {
+
+/// Identifies one state of a file without reading it: two equal stamps mean that the file is still the same
+/// one and was not written in between.
+struct FileStamp
+{
+    uint64_t device = 0;
+    uint64_t inode = 0;
+    uint64_t byteCount = 0;
+    int64_t modified = 0; ///< nanoseconds
+    int64_t changed = 0;  ///< nanoseconds; also set by whatever sets `modified` back
+
+    friend bool operator==(const FileStamp&, const FileStamp&) = default;
+};
+
+/// The stamp of a file, with links followed. Null if there is no such file.
+std::optional<FileStamp> StampOf(const std::string& path);
+
+} // namespace gw
