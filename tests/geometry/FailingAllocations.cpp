@@ -15,6 +15,12 @@ void* operator new(size_t size)
     throw std::bad_alloc();
 }
 
+// The sanitizer has one of its own, whose memory may not be freed below.
+void* operator new(size_t size, const std::nothrow_t&) noexcept
+{
+    return g_iAllocationsLeft == 0 ? nullptr : std::malloc(size);
+}
+
 void operator delete(void* memory) noexcept
 {
     std::free(memory);
