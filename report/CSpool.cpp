@@ -1,12 +1,40 @@
 #include "CSpool.h"
 
+#include "CPrivateFile.h"
 #include "CSafeFile.h"
+#include "Paths.h"
 
 #include <array>
+#include <filesystem>
+#include <string>
+#include <system_error>
+
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace gw {
 
-CSpool::CSpool() : m_pkFile(std::tmpfile()) {}
+namespace {
+
+// std::tmpfile ignores the user's choice of a folder.
+std::FILE* OpenNameless()
+{
+    std::error_code error;
+    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
+    std::string path;
+    const int file = error ? -1 : CreatePrivateFile(folder, ".tmp", S_IRUSR | S_IWUSR, path);
+    if (file < 0)
+        return nullptr;
+    unlink(path.c_str());
+    std::FILE* const stream = fdopen(file, "w+");
+    if (!stream)
+        close(file);
+    return stream;
+}
+
+} // namespace
+
+CSpool::CSpool() : m_pkFile(OpenNameless()) {}
 
 CSpool::~CSpool()
 {
