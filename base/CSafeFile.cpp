@@ -131,6 +131,8 @@ bool CSafeFile::Sync(int file) const
     if (IsPrivateName(std::string_view(m_kPath).substr(FolderOf(m_kPath).size())))
         return true;
     const bool isLater = ms_bSyncsDeferred && m_uiMode == 0;
+    if (isLater) // the disk begins now, so that little is left for the sync of all
+        sync_file_range(file, 0, 0, SYNC_FILE_RANGE_WRITE);
     return (isLater || fsync(file) == 0) && (!ms_kCommitGate || ms_kCommitGate(m_kPrivatePath));
 }
 

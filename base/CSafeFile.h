@@ -40,9 +40,9 @@ public:
     /// that works ahead holds back here what is out of turn. It does not apply to private files. An empty
     /// gate lets everything pass.
     static void SetCommitGate(CommitGate gate);
-    /// From now on, files that replace nothing are not synced one by one: the program syncs them all later,
-    /// before it claims that they are saved. A file that replaces another is still synced first, because a
-    /// power failure could otherwise cost both.
+    /// From now on, files that replace nothing are not synced one by one: their writing is only begun, and
+    /// the program syncs them all later, before it claims that they are saved. A file that replaces another
+    /// is still synced first, because a power failure could otherwise cost both.
     static void DeferSyncs(bool deferred) { ms_bSyncsDeferred = deferred; }
 
 private:

@@ -1,7 +1,5 @@
 #include "CDeferredSync.h"
 
-#include <algorithm>
-
 #include <fcntl.h>
 #include <sys/stat.h>
 #include <unistd.h>
@@ -23,10 +21,10 @@ bool SyncOne(int file)
 
 CDeferredSync::~CDeferredSync()
 {
-    for (const auto& [device, file] : m_kOpen)
+    for (const auto& [device, system] : m_kOpen)
     {
-        if (file >= 0)
-            close(file);
+        if (system.file >= 0)
+            close(system.file);
     }
 }
 
@@ -34,12 +32,18 @@ void CDeferredSync::Add(const std::string& path)
 {
     struct stat status = {};
     if (stat(path.c_str(), &status) == 0 && !m_kOpen.contains(status.st_dev))
-        m_kOpen[status.st_dev] = open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
+        m_kOpen[status.st_dev] = {path, open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)};
 }
 
-bool CDeferredSync::Sync() const
+std::string CDeferredSync::Sync() const
 {
-    return std::ranges::count_if(m_kOpen, [](const auto& entry) { return !SyncOne(entry.second); }) == 0;
+    std::string failed;
+    for (const auto& [device, system] : m_kOpen)
+    {
+        if (!SyncOne(system.file))
+            failed = system.path;
+    }
+    return failed;
 }
 
 } // namespace gw

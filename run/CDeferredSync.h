@@ -18,11 +18,18 @@ public:
 
     /// Adds the file system of a file or folder. A failure to write there is reported by Sync from then on.
     void Add(const std::string& path);
-    /// Returns when everything on these file systems is on the disk. False if a write failed since Add.
-    bool Sync() const;
+    /// Returns when everything on these file systems is on the disk. Answers a path on one where a write
+    /// failed since Add, or an empty text.
+    std::string Sync() const;
 
 private:
-    std::map<dev_t, int> m_kOpen; ///< an open file for each file system, below 0 where it could not be opened
+    struct FileSystem
+    {
+        std::string path;
+        int file = -1; ///< an open file there, below 0 where none could be opened
+    };
+
+    std::map<dev_t, FileSystem> m_kOpen;
 };
 
 } // namespace gw

@@ -194,9 +194,12 @@ bool CFileRun::SyncResults()
 {
     if (m_kOptions.resume && m_kResume.HasUnsynced())
         m_kSync.Add(m_kState.folder.empty() ? "." : m_kState.folder);
-    const bool isSynced = m_kSync.Sync();
+    const std::string failed = m_kSync.Sync();
+    const bool isSynced = failed.empty();
     if (!isSynced)
-        SayError("the disk reports a failed write; some of the results may be damaged");
+        SayError(Printable(failed) +
+                 ": the disk reports a failed write; this result or others of the run may be "
+                 "damaged");
     const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
     if (isSynced && isNews && m_kOptions.resume && !m_kOptions.dryRun)
         m_kResume.AddSynced();
