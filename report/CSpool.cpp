@@ -1,15 +1,14 @@
 #include "CSpool.h"
 
-#include "CPrivateFile.h"
 #include "CSafeFile.h"
-#include "Paths.h"
 
 #include <array>
+#include <cstdlib>
 #include <filesystem>
 #include <string>
 #include <system_error>
 
-#include <sys/stat.h>
+#include <fcntl.h>
 #include <unistd.h>
 
 namespace gw {
@@ -20,9 +19,8 @@ namespace {
 std::FILE* OpenNameless()
 {
     std::error_code error;
-    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    std::string path;
-    const int file = error ? -1 : CreatePrivateFile(folder, ".tmp", S_IRUSR | S_IWUSR, path);
+    std::string path = (std::filesystem::temp_directory_path(error) / "gaitwright-XXXXXX").string();
+    const int file = error ? -1 : mkostemp(path.data(), O_CLOEXEC);
     if (file < 0)
         return nullptr;
     unlink(path.c_str());
