@@ -52,9 +52,10 @@ bool MayReplace(const std::string& path, unsigned& mode)
 
 } // namespace
 
-std::function<bool()> CSafeFile::ms_kCommitGate;
+CSafeFile::CommitGate CSafeFile::ms_kCommitGate;
+bool CSafeFile::ms_bSyncsDeferred = false;
 
-void CSafeFile::SetCommitGate(std::function<bool()> gate)
+void CSafeFile::SetCommitGate(CommitGate gate)
 {
     ms_kCommitGate = std::move(gate);
 }
@@ -129,7 +130,10 @@ bool CSafeFile::Sync(int file) const
 {
     if (IsPrivateName(std::string_view(m_kPath).substr(FolderOf(m_kPath).size())))
         return true;
-    return fsync(file) == 0 && (!ms_kCommitGate || ms_kCommitGate());
+    const bool isLater = ms_bSyncsDeferred && m_uiMode == 0;
+    if (isLater) // the disk begins now, so that little is left for the sync of all
+        sync_file_range(file, 0, 0, SYNC_FILE_RANGE_WRITE);
+    return (isLater || fsync(file) == 0) && (!ms_kCommitGate || ms_kCommitGate(m_kPrivatePath));
 }
 
 void CSafeFile::Discard()

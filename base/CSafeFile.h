@@ -34,16 +34,23 @@ public:
     /// Where the bytes lie before Commit.
     const std::string& PrivatePath() const { return m_kPrivatePath; }
 
-    /// From now on Commit asks before it renames, when all bytes are on the disk; false fails it. It is the
-    /// process's own: a program that works ahead holds back here what comes out of turn. Private files are
-    /// not asked for. An empty gate lets all pass.
-    static void SetCommitGate(std::function<bool()> gate);
+    /// Answers whether the file under a private path, which has all its bytes, may take its place.
+    using CommitGate = std::function<bool(const std::string& privatePath)>;
+    /// From now on Commit asks before it renames; false fails it. The gate belongs to the process: a program
+    /// that works ahead holds back here what is out of turn. It does not apply to private files. An empty
+    /// gate lets everything pass.
+    static void SetCommitGate(CommitGate gate);
+    /// From now on, files that replace nothing are not synced one by one: their writing is only begun, and
+    /// the program syncs them all later, before it claims that they are saved. A file that replaces another
+    /// is still synced first, because a power failure could otherwise cost both.
+    static void DeferSyncs(bool deferred) { ms_bSyncsDeferred = deferred; }
 
 private:
     bool Sync(int file) const;
     void Discard();
 
-    static std::function<bool()> ms_kCommitGate;
+    static CommitGate ms_kCommitGate;
+    static bool ms_bSyncsDeferred;
     std::string m_kPath;
     std::string m_kPrivatePath;
     int m_iFile = -1;

@@ -44,9 +44,12 @@ public:
     }
 
 private:
-    // No rotation turns by more than its angles do together, and angles are quickly compared.
+    // No rotation turns by more than its angles do together, and angles are quickly compared. Joints without
+    // channels are free in a file, and so must not cost a walk through the rows each.
     bool MayJump(const std::vector<size_t>& columns) const
     {
+        if (columns.empty())
+            return false;
         for (size_t row = 1; row < m_kTable.RowCount(); ++row)
         {
             float turn = 0.0f;

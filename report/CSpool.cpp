@@ -3,10 +3,36 @@
 #include "CSafeFile.h"
 
 #include <array>
+#include <cstdlib>
+#include <filesystem>
+#include <string>
+#include <system_error>
+
+#include <fcntl.h>
+#include <unistd.h>
 
 namespace gw {
 
-CSpool::CSpool() : m_pkFile(std::tmpfile()) {}
+namespace {
+
+// std::tmpfile ignores the user's choice of a folder.
+std::FILE* OpenNameless()
+{
+    std::error_code error;
+    std::string path = (std::filesystem::temp_directory_path(error) / "gaitwright-XXXXXX").string();
+    const int file = error ? -1 : mkostemp(path.data(), O_CLOEXEC);
+    if (file < 0)
+        return nullptr;
+    unlink(path.c_str());
+    std::FILE* const stream = fdopen(file, "w+");
+    if (!stream)
+        close(file);
+    return stream;
+}
+
+} // namespace
+
+CSpool::CSpool() : m_pkFile(OpenNameless()) {}
 
 CSpool::~CSpool()
 {

@@ -8,8 +8,8 @@ namespace gw {
 
 class CSafeFile;
 
-/// Text that waits in a nameless temporary file until what stands before it is known: a page of hundreds of
-/// motions need not lie in memory.
+/// Text that waits in a nameless temporary file (under TMPDIR) until what stands before it is known: a page
+/// of hundreds of motions need not lie in memory.
 class CSpool
 {
 public:

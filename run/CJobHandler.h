@@ -35,6 +35,8 @@ public:
     /// Does a job. Runs in a worker process, which is a copy of the program as it stood when it was started:
     /// what it changes in memory stays there. Answers a number of the handler's own.
     virtual uint8_t Run(size_t job, std::FILE* record) = 0;
+    /// A job's result lies complete under a private path and takes its place next. Runs in the worker.
+    virtual void Ready(size_t, const std::string&) {}
     /// A job's process is gone; nobody works on it any longer. Comes at once.
     virtual void Lost(size_t) {}
     /// A job ended. Comes in the order of the jobs, whichever ended first. False ends the run.

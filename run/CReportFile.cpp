@@ -1,5 +1,8 @@
 #include "CReportFile.h"
 
+#include "CMappedFile.h"
+#include "Text.h"
+
 #include <cerrno>
 #include <utility>
 
@@ -7,6 +10,18 @@
 #include <unistd.h>
 
 namespace gw {
+
+// A plan, a state and what other commands print with --json are lines of JSON too.
+bool CReportFile::IsReport(const std::string& path)
+{
+    CMappedFile file;
+    if (file.Open(path) != EFailure::None)
+        return false;
+    std::string_view rest = file.Text();
+    std::string_view line;
+    return !NextLine(rest, line) ||
+           (line.starts_with(R"({"source":")") && line.find(R"(,"outcome":")") != line.npos);
+}
 
 CReportFile::~CReportFile()
 {

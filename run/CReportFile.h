@@ -16,6 +16,10 @@ public:
         AtEnd, ///< behind what is there; half a line of a writer that died is closed first
     };
 
+    /// Whether a file is empty or begins as a report does: with a line about a source and what became of it.
+    /// False for a file that cannot be read.
+    static bool IsReport(const std::string& path);
+
     CReportFile() = default;
     ~CReportFile();
     CReportFile(const CReportFile&) = delete;

@@ -9,6 +9,8 @@
 
 #include <algorithm>
 
+#include <sys/stat.h>
+
 namespace gw {
 
 namespace {
@@ -17,6 +19,7 @@ using Json = nlohmann::ordered_json;
 
 constexpr std::string_view kPrefix = ".gaitwright.resume.";
 constexpr std::string_view kExtension = ".jsonl";
+constexpr std::string_view kSynced = R"({"synced":true})"; // no text in JSON can contain it
 
 // A name as the state knows it: JSON, which keeps no bytes that are no UTF-8.
 std::string Kept(const std::string& output)
@@ -47,11 +50,13 @@ void CResumeState::ReadFile(const std::string& path)
     if (file.Open(path) != EFailure::None)
         return;
     std::string_view rest = file.Text();
+    const size_t synced = rest.rfind(kSynced);
+    const char* const syncedEnd = rest.data() + (synced == rest.npos ? 0 : synced);
     for (std::string_view line; NextLine(rest, line);)
-        TakeLine(line);
+        TakeLine(line, line.data() < syncedEnd);
 }
 
-void CResumeState::TakeLine(std::string_view line)
+void CResumeState::TakeLine(std::string_view line, bool isSynced)
 {
     const Json json = Json::parse(line, nullptr, false);
     std::string output;
@@ -59,9 +64,14 @@ void CResumeState::TakeLine(std::string_view line)
         return;
     std::vector<Made>& made = m_kMade[Kept(output)];
     Made entry;
-    if (TakeText(json, "key", entry.key) && TakeText(json, "digits", entry.digits) &&
-        TakeText(json, "told", entry.told))
-        made.push_back(std::move(entry));
+    if (!TakeText(json, "digits", entry.digits))
+        return;
+    if (!TakeText(json, "key", entry.key) || !TakeText(json, "told", entry.told))
+        entry.key.clear();
+    // Earlier versions synced each result before its line.
+    if (!isSynced && TakeText(json, "modified", entry.modified))
+        m_bUnsynced = true;
+    made.push_back(std::move(entry));
 }
 
 bool CResumeState::Knows(const std::string& output) const
@@ -69,33 +79,58 @@ bool CResumeState::Knows(const std::string& output) const
     return m_kMade.contains(Kept(output));
 }
 
+bool CResumeState::IsOwn(const std::string& output, const std::string& digits,
+                         const std::string& modified) const
+{
+    const auto found = m_kMade.find(Kept(output));
+    return found != m_kMade.end() && std::ranges::any_of(found->second, [&](const Made& entry) {
+               return entry.digits == digits || (!entry.modified.empty() && entry.modified == modified);
+           });
+}
+
 const std::string* CResumeState::FindTold(const std::string& output, const std::string& key,
                                           const std::string& digits) const
 {
     const auto found = m_kMade.find(Kept(output));
-    if (found == m_kMade.end())
+    if (found == m_kMade.end() || digits.empty())
         return nullptr;
     const auto made = std::ranges::find_if(
         found->second, [&](const Made& entry) { return entry.key == key && entry.digits == digits; });
     return made == found->second.end() ? nullptr : &made->told;
 }
 
-bool CResumeState::AddBegun(const std::string& output)
+bool CResumeState::AddReady(const std::string& output, const std::string& digits, const std::string& modified)
 {
     return m_kFile.AddLine(DumpJson(Json{
-        {"output", output}
+        {"output",   output  },
+        {"digits",   digits  },
+        {"modified", modified}
     }));
 }
 
 bool CResumeState::AddMade(const std::string& output, const std::string& key, const std::string& digits,
-                           const std::string& told)
+                           const std::string& modified, const std::string& told)
 {
     return m_kFile.AddLine(DumpJson(Json{
-        {"output", output},
-        {"key",    key   },
-        {"digits", digits},
-        {"told",   told  }
+        {"output",   output  },
+        {"key",      key     },
+        {"digits",   digits  },
+        {"modified", modified},
+        {"told",     told    }
     }));
+}
+
+bool CResumeState::AddSynced()
+{
+    return m_kFile.AddLine(kSynced);
+}
+
+std::string ModificationDigits(const std::string& path)
+{
+    struct stat status = {};
+    if (stat(path.c_str(), &status) != 0)
+        return {};
+    return std::to_string(status.st_mtim.tv_sec) + '.' + std::to_string(status.st_mtim.tv_nsec);
 }
 
 } // namespace gw

@@ -28,10 +28,9 @@ bool Reply(int socket, const CWorkerReply& reply)
 } // namespace
 
 CWorkerLoop::CWorkerLoop(CJobHandler& handler, int socket, std::FILE* record, ECommit commit)
-    : m_kHandler(handler), m_iSocket(socket), m_pkRecord(record)
+    : m_kHandler(handler), m_iSocket(socket), m_pkRecord(record), m_eCommit(commit)
 {
-    if (commit == ECommit::InTurn)
-        CSafeFile::SetCommitGate([this] { return AskToCommit(); });
+    CSafeFile::SetCommitGate([this](const std::string& privatePath) { return MayCommit(privatePath); });
 }
 
 void CWorkerLoop::Run()
@@ -40,7 +39,8 @@ void CWorkerLoop::Run()
     {
         const Clock::time_point start = Clock::now();
         m_kWaited = {};
-        m_bMayCommit = false;
+        m_bMayCommit = m_eCommit == ECommit::AtOnce;
+        m_uiJob = order.job;
         const uint8_t answer = m_kHandler.Run(order.job, m_pkRecord);
         const std::chrono::duration<double> worked = Clock::now() - start - m_kWaited;
         std::fflush(nullptr);
@@ -49,11 +49,19 @@ void CWorkerLoop::Run()
     }
 }
 
+bool CWorkerLoop::MayCommit(const std::string& privatePath)
+{
+    if (!m_bMayCommit && !AskToCommit())
+        return false;
+    m_kHandler.Ready(m_uiJob, privatePath);
+    return true;
+}
+
 bool CWorkerLoop::AskToCommit()
 {
     const Clock::time_point start = Clock::now();
     CWorkerOrder order;
-    m_bMayCommit = m_bMayCommit || (Reply(m_iSocket, {.asks = true}) && Receive(m_iSocket, order));
+    m_bMayCommit = Reply(m_iSocket, {.asks = true}) && Receive(m_iSocket, order);
     m_kWaited += Clock::now() - start;
     return m_bMayCommit;
 }

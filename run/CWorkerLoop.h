@@ -23,11 +23,14 @@ public:
 private:
     using Clock = std::chrono::steady_clock;
 
+    bool MayCommit(const std::string& privatePath);
     bool AskToCommit();
 
     CJobHandler& m_kHandler;
     int m_iSocket;
     std::FILE* m_pkRecord;
+    ECommit m_eCommit;
+    size_t m_uiJob = 0;
     Clock::duration m_kWaited{};
     bool m_bMayCommit = false; ///< this job, from here on
 };

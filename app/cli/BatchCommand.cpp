@@ -5,6 +5,7 @@
 #include "CShellContent.h"
 #include "CShellWindow.h"
 #include "Commands.h"
+#include "Output.h"
 #include "Paths.h"
 #include "ProfileFit.h"
 #include "ReportJson.h"
@@ -109,6 +110,8 @@ EExit RunBatchFolder(const COptions& options)
         return Refuse(Printable(options.files[0]) + ": there is no such folder");
     if (!IsRunPossible(options))
         return EExit::Usage;
+    if (!options.files.empty() && !CanListFolder(options, options.files[0]))
+        return EExit::Failed;
     CFileRun::Jobs jobs;
     if (!ListJobs(options, jobs))
         return EExit::Failed;

@@ -4,6 +4,7 @@
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CReport.h"
+#include "CSafeFile.h"
 #include "CTextFile.h"
 #include "CWorkerPool.h"
 #include "Commands.h"
@@ -107,9 +108,9 @@ EExit CFileRun::RunAll()
 
 bool CFileRun::Open()
 {
-    if (!m_kOptions.dryRun && !OpenReport())
-        return false;
     if (m_kOptions.resume && !OpenState())
+        return false;
+    if (!m_kOptions.dryRun && !OpenReport()) // last, because it empties what was there
         return false;
     if (!m_kOptions.dryRun)
         SweepLeftovers();
@@ -120,14 +121,29 @@ bool CFileRun::OpenReport()
 {
     if (m_kOptions.report.empty())
         return true;
-    COptions options = m_kOptions;
-    options.force = options.force || options.resume; // it says again what the first one said
-    if (!MayWrite(options, m_kOptions.report))
+    if (const std::optional<CReport> refusal = WhyNotReport())
+    {
+        SayReport(m_kOptions, *refusal);
         return false;
+    }
     if (m_kReport.Open(m_kOptions.report, CReportFile::EStart::Empty))
         return true;
     SayError(Printable(m_kOptions.report) + ": the report cannot be written");
     return false;
+}
+
+std::optional<CReport> CFileRun::WhyNotReport() const
+{
+    const std::string& path = m_kOptions.report;
+    const auto isReport = [&](const std::string& other) { return IsSameFile(path, other); };
+    if (std::ranges::any_of(m_kJobs, isReport, &CConversionJob::source) ||
+        std::ranges::any_of(m_kJobs, isReport, &CConversionJob::output) || isReport(m_kOptions.filesFrom) ||
+        isReport(m_kOptions.html) || isReport(m_kOptions.profile))
+        return ShellFailure(path, "in-use",
+                            "the run reads or writes this file; name another one for the report");
+    if (m_kOptions.resume && CReportFile::IsReport(path))
+        return std::nullopt; // it says again what the first one said
+    return WhyNotWrite(m_kOptions, path);
 }
 
 bool CFileRun::OpenState()
@@ -164,7 +180,8 @@ EExit CFileRun::Finish(bool ran, int requests)
         SayError("the system gives no process to work on; --jobs with a smaller number may help");
     if (requests > 0)
         SayError("interrupted");
-    const bool good = TellEnd();
+    const bool isSynced = SyncResults();
+    const bool good = TellEnd() && isSynced;
     if (m_bReportFailed)
         SayError(Printable(m_kOptions.report) + ": the report cannot be written to its end");
     if (requests > 0)
@@ -172,11 +189,29 @@ EExit CFileRun::Finish(bool ran, int requests)
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
 }
 
+// Before anything says that the run is done. A run of one file has synced it already.
+bool CFileRun::SyncResults()
+{
+    if (m_kOptions.resume && m_kResume.HasUnsynced())
+        m_kSync.Add(m_kState.folder.empty() ? "." : m_kState.folder);
+    const std::string failed = m_kSync.Sync();
+    const bool isSynced = failed.empty();
+    if (!isSynced)
+        SayError(Printable(failed) +
+                 ": the disk reports a failed write; this result or others of the run may be "
+                 "damaged");
+    const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
+    if (isSynced && isNews && m_kOptions.resume && !m_kOptions.dryRun)
+        m_kResume.AddSynced();
+    return isSynced;
+}
+
 // In a worker.
 
 uint8_t CFileRun::Run(size_t index, std::FILE* record)
 {
     const CConversionJob& job = m_kJobs[index];
+    CSafeFile::DeferSyncs(IsSyncDeferred());
     if (!m_kOptions.dryRun)
         CreateFolder(FolderOf(job.output));
     std::string line;
@@ -194,7 +229,10 @@ CFileRun::CFileEnd CFileRun::ConvertGuarded(const COptions& options, size_t inde
     CFileEnd end{.endsRun = !options.keepGoing};
     try
     {
-        end = Convert(options, index, text.File());
+        if (FolderExists(m_kJobs[index].source)) // in a tree, what cannot be listed stands for its files
+            TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
+        else
+            end = Convert(options, index, text.File());
     } catch (const std::bad_alloc&)
     {
         TellLost(index, ShellFailure(m_kJobs[index].source, "memory", "there is not enough memory for this"),
@@ -211,20 +249,45 @@ CFileRun::CFileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
     const std::string name = NameInState(job);
     const std::string key = KeyOf(job);
     const std::string head = RecordHead(job);
-    if (const std::string* told = m_kResume.FindTold(name, key, FileDigits(job.output)))
+    const std::string digits = FileDigits(job.output);
+    if (const std::string* told = m_kResume.FindTold(name, key, digits))
     {
         TellUpToDate(index);
         line = head + *told + ",\"resumed\":true";
         return {.outcome = EConversion::Skipped};
     }
     COptions options = m_kOptions;
-    options.force = options.force || m_kResume.Knows(name); // else what is there is a stranger's
-    if (!options.dryRun && !m_kResume.Knows(name) && (options.force || !IsTaken(job.output)))
-        m_kResume.AddBegun(name);
+    if (!options.force && m_kResume.Knows(name) && FileExists(job.output))
+    {
+        if (!m_kResume.IsOwn(name, digits, ModificationDigits(job.output)))
+            return KeepChanged(index, line);
+        options.force = true;
+    }
     const CFileEnd end = ConvertGuarded(options, index, line);
     if (end.outcome == EConversion::Converted)
-        m_kResume.AddMade(name, key, FileDigits(job.output), line.substr(std::min(head.size(), line.size())));
+        m_kResume.AddMade(name, key, m_kReadyDigits, m_kReadyModified,
+                          line.substr(std::min(head.size(), line.size())));
     return end;
+}
+
+CFileRun::CFileEnd CFileRun::KeepChanged(size_t index, std::string& line)
+{
+    CTextFile text;
+    TellLost(index,
+             ShellFailure(m_kJobs[index].output, "changed",
+                          "this file was changed after the run made it, and was kept; --force replaces it"),
+             text.File());
+    line = Timed(text.Text(), 0.0);
+    return {.endsRun = !m_kOptions.keepGoing};
+}
+
+void CFileRun::Ready(size_t index, const std::string& privatePath)
+{
+    if (!m_kOptions.resume)
+        return;
+    m_kReadyDigits = FileDigits(privatePath);
+    m_kReadyModified = ModificationDigits(privatePath);
+    m_kResume.AddReady(NameInState(m_kJobs[index]), m_kReadyDigits, m_kReadyModified);
 }
 
 std::string CFileRun::KeyOf(const CConversionJob& job) const
@@ -255,6 +318,8 @@ bool CFileRun::Take(size_t index, const CJobEnd& end)
     std::fflush(stdout);
     const auto outcome = lost ? EConversion::Failed : static_cast<EConversion>(end.answer & kOutcomeBits);
     ++m_kTally[outcome];
+    if (outcome == EConversion::Converted && IsSyncDeferred())
+        m_kSync.Add(m_kJobs[index].output);
     m_bAbandoned = m_bAbandoned || (end.answer & kAbandons) != 0;
     std::string_view enclosure = record;
     std::string_view line;

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CDeferredSync.h"
 #include "CInterrupt.h"
 #include "CJobHandler.h"
 #include "CProgressBar.h"
@@ -7,6 +8,7 @@
 #include "CResumeState.h"
 #include "RunTally.h"
 
+#include <optional>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -14,6 +16,7 @@
 namespace gw {
 
 class CContentHash;
+struct CReport;
 
 /// Where a run keeps what the next one is to know.
 struct CRunState
@@ -39,6 +42,7 @@ public:
     const CRunTally& Tally() const { return m_kTally; }
 
     uint8_t Run(size_t job, std::FILE* record) final;
+    void Ready(size_t job, const std::string& privatePath) final;
     void Lost(size_t job) final;
     bool Take(size_t job, const CJobEnd& end) final;
     void Tick(size_t ended) final;
@@ -74,11 +78,15 @@ protected:
 private:
     bool Open();
     bool OpenReport();
+    std::optional<CReport> WhyNotReport() const;
     bool OpenState();
+    bool IsSyncDeferred() const { return m_kJobs.size() > 1; }
+    bool SyncResults();
     void SweepLeftovers() const;
     EExit Finish(bool ran, int requests);
     CFileEnd ConvertGuarded(const COptions& options, size_t index, std::string& line);
     CFileEnd ConvertResumed(size_t index, std::string& line);
+    CFileEnd KeepChanged(size_t index, std::string& line);
     std::string KeyOf(const CConversionJob& job) const;
     std::string NameInState(const CConversionJob& job) const;
     std::string TakeLost(size_t index, const CJobEnd& end);
@@ -88,8 +96,11 @@ private:
     Jobs m_kJobs;
     CRunState m_kState;
     CResumeState m_kResume;
-    std::string m_kCommonKey; ///< of everything but the source
+    std::string m_kCommonKey;     ///< of everything but the source
+    std::string m_kReadyDigits;   ///< of the job's result, in a worker
+    std::string m_kReadyModified; ///< and when it was written
     CReportFile m_kReport;
+    CDeferredSync m_kSync;
     CProgressBar m_kBar;
     CRunTally m_kTally;
     bool m_bAbandoned = false;

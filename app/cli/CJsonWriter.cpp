@@ -11,6 +11,29 @@ namespace {
 
 constexpr size_t kGatherBytes = size_t{1} << 16;
 
+// The library escapes control characters below U+0020 only. Those from U+007F to U+009F command terminals
+// too.
+std::string WithEscapedControls(const std::string& json)
+{
+    std::string escaped;
+    escaped.reserve(json.size());
+    for (size_t i = 0; i < json.size(); ++i)
+    {
+        const bool isPair =
+            json[i] == '\xc2' && static_cast<unsigned char>(json[i + 1]) < 0xa0; // valid UTF-8
+        if (!isPair && json[i] != '\x7f')
+        {
+            escaped += json[i];
+            continue;
+        }
+        char digits[8];
+        i += isPair ? 1 : 0;
+        std::snprintf(digits, sizeof digits, "\\u%04x", static_cast<unsigned char>(json[i]));
+        escaped += digits;
+    }
+    return escaped;
+}
+
 } // namespace
 
 void CJsonWriter::Flush()
@@ -63,7 +86,7 @@ CJsonWriter& CJsonWriter::Key(std::string_view name)
 void CJsonWriter::Text(std::string_view text)
 {
     const nlohmann::json value(text);
-    Plain(value.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace));
+    Plain(WithEscapedControls(value.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace)));
 }
 
 void CJsonWriter::Integer(int64_t value)

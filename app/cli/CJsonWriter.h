@@ -9,8 +9,8 @@
 namespace gw {
 
 /// JSON on its way to a file, written as it comes: a large scene is never in memory a second time. What is no
-/// number becomes the text "nan", "inf" or "-inf", and bytes that are no UTF-8 become U+FFFD, so that every
-/// reader takes the result.
+/// number becomes the text "nan", "inf" or "-inf", bytes that are no UTF-8 become U+FFFD, and all control
+/// characters are escaped, so that every reader accepts the result and no terminal obeys it.
 class CJsonWriter
 {
 public:

@@ -13,6 +13,7 @@
 #include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "ReportJson.h"
+#include "ResultSize.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -55,7 +56,7 @@ public:
 
     EConversion Run()
     {
-        if (!Open() || !SelectProfile() || !MayConvert())
+        if (!Open() || !SelectProfile() || !MayConvert() || !MayFit())
             return EConversion::Failed;
         if (m_kOptions.dryRun)
             return EConversion::Planned;
@@ -80,6 +81,7 @@ private:
     void Check();
     void KeepMisfit();
     bool RefuseEmpty();
+    bool MayFit();
 
     const COptions& m_kOptions;
     const CConversionJob& m_kJob;
@@ -115,6 +117,14 @@ bool CConversion::RefuseEmpty()
     m_kWindow.Report(
         ShellFailure(m_kJob.source, "no-frames", "the motion has no frames; there is nothing to convert"));
     return false;
+}
+
+bool CConversion::MayFit()
+{
+    const std::optional<CReport> refusal = WhyTooLarge(m_kContent, m_kJob);
+    if (refusal)
+        m_kWindow.Report(*refusal);
+    return !refusal;
 }
 
 bool CConversion::Convert()

@@ -9,7 +9,6 @@
 #include "Words.h"
 
 #include <cstdio>
-#include <filesystem>
 
 namespace gw {
 
@@ -135,12 +134,6 @@ bool Refuse(const std::string& words)
 {
     SayError(words);
     return false;
-}
-
-bool IsSameFile(const std::string& a, const std::string& b)
-{
-    std::error_code error;
-    return std::filesystem::equivalent(a, b, error);
 }
 
 bool CanFix(const COptions& options)

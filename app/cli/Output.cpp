@@ -6,6 +6,7 @@
 #include "Words.h"
 
 #include <cstdio>
+#include <filesystem>
 
 namespace gw {
 
@@ -20,6 +21,26 @@ bool IsDecidedOnExisting(const COptions& options)
 bool IsTaken(const std::string& path)
 {
     return FileExists(path) || FolderExists(path);
+}
+
+CReport UnreadableFolder(const std::string& path)
+{
+    return ShellFailure(path, "unreadable-folder", "the folder cannot be read (check its permissions)");
+}
+
+bool CanListFolder(const COptions& options, const std::string& path)
+{
+    std::error_code error;
+    const std::filesystem::directory_iterator entries(path, error);
+    if (error)
+        SayReport(options, UnreadableFolder(path));
+    return !error;
+}
+
+bool IsSameFile(const std::string& a, const std::string& b)
+{
+    std::error_code error;
+    return std::filesystem::equivalent(a, b, error);
 }
 
 std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path)

@@ -13,6 +13,12 @@ namespace gw {
 bool IsDecidedOnExisting(const COptions& options);
 /// Whether something stands under a path already.
 bool IsTaken(const std::string& path);
+/// The failure of a folder whose files cannot be listed.
+CReport UnreadableFolder(const std::string& path);
+/// Whether the files of a folder can be listed. Says so if not.
+bool CanListFolder(const COptions& options, const std::string& path);
+/// Whether two paths lead to one existing file.
+bool IsSameFile(const std::string& a, const std::string& b);
 /// Why a command may not write a file: it is there without --force, or it is a folder.
 std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path);
 /// Whether a command may write a file. Says why not.

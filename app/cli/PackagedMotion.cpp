@@ -7,6 +7,7 @@
 #include "CSafeFile.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
+#include "Text.h"
 #include "Words.h"
 
 #include <filesystem>
@@ -15,15 +16,29 @@ namespace gw {
 
 namespace {
 
-// Streams read files, so that the bytes inside a package have to become one for a moment.
-bool LoadBytes(std::span<const std::byte> bytes, const char* extension, CMotionFile& motion)
+bool SayNoTemporary(const std::string& folder)
+{
+    SayError(Printable(folder) + ": no temporary file can be written here (check the free space and the "
+                                 "permissions, or set TMPDIR to another folder)");
+    return false;
+}
+
+// Streams read files, so the bytes inside a package have to become one for a moment. Says why it fails.
+bool LoadBytes(const std::string& path, std::span<const std::byte> bytes, const char* extension,
+               CMotionFile& motion)
 {
     std::error_code error;
     const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
+    if (error)
+        return SayNoTemporary("TMPDIR");
     const CPrivateFile inner(folder, extension);
     CSafeFile file;
-    return !inner.Path().empty() && file.Open(inner.Path()) && file.Write(bytes) && file.Commit() &&
-           motion.Load(inner.Path());
+    if (inner.Path().empty() || !file.Open(inner.Path()) || !file.Write(bytes) || !file.Commit())
+        return SayNoTemporary(folder);
+    if (motion.Load(inner.Path()))
+        return true;
+    SayFailure(path, motion.Record().Failure());
+    return false;
 }
 
 } // namespace
@@ -49,10 +64,9 @@ bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMot
 {
     const CPackageBlocks blocks = FindPackage(scene);
     CPackageFacts facts;
-    const bool known = blocks.file && ReadPackageFacts(*blocks.info, facts);
-    if (known && LoadBytes(blocks.file->Data(), FormatExtension(facts.format), motion))
-        return true;
-    SayFailure(path, known ? motion.Record().Failure() : CFailure{EFailure::Empty, 0, "MotionFile"});
+    if (blocks.file && ReadPackageFacts(*blocks.info, facts))
+        return LoadBytes(path, blocks.file->Data(), FormatExtension(facts.format), motion);
+    SayFailure(path, {EFailure::Empty, 0, "MotionFile"});
     return false;
 }
 

@@ -34,9 +34,10 @@ bool WritePage(const COptions& options, CConversionPage& page)
 {
     if (!page.Write(options.html))
     {
-        SayError(Printable(options.html) +
-                 ": the page cannot be written (check the path, the permissions and " +
-                 "the room on the disk)");
+        SayError(
+            Printable(options.html) +
+            ": the page cannot be written (check the path, the permissions, and the free space on the disk "
+            "and in the folder for temporary files)");
         return false;
     }
     SayWord(options, "the page is " + Printable(options.html));

@@ -1,6 +1,7 @@
 #include "CConversionRun.h"
 #include "Commands.h"
 #include "OptionJson.h"
+#include "Output.h"
 #include "Paths.h"
 #include "PlanFile.h"
 #include "RunSetup.h"
@@ -19,6 +20,11 @@ bool TakePlan(const CRunPlan& plan, size_t shard, COptions& options)
     if (!ReadOptionsJson(plan.options, ~kHowToRun, options, wrong))
     {
         SayError(Printable(planPath) + ":1: the plan has an option that there is not: " + Quoted(wrong));
+        return false;
+    }
+    if (IsSameFile(options.report, planPath))
+    {
+        SayError(Printable(options.report) + ": this is the plan; name another file for the report");
         return false;
     }
     options.files.clear();

@@ -1,10 +1,13 @@
 #include "CMotionFile.h"
+#include "CReport.h"
 #include "Commands.h"
 #include "Output.h"
 #include "Paths.h"
 #include "TKBVHStream.h"
 #include "Text.h"
 #include "Words.h"
+
+#include <cmath>
 
 namespace gw {
 
@@ -34,6 +37,18 @@ bool CanTranscode(const COptions& options)
     return false;
 }
 
+// A .bvh is written without the last frame, and its frame time has six digits behind the point.
+const char* WhyNoBVH(const CMotionFile& motion)
+{
+    constexpr float kLeastFrameTime = 0.0000005f;
+    if (motion.GetLastFrame() <= -1.0f)
+        return "the motion has no frames; there is nothing to write";
+    if (!(motion.GetFrequency() >= kLeastFrameTime) || !std::isfinite(motion.GetFrequency()))
+        return "the frame time is 0 or too small for a .bvh, which keeps six digits; no rate could be read "
+               "from it";
+    return nullptr;
+}
+
 } // namespace
 
 EExit RunTranscode(const COptions& options)
@@ -53,6 +68,11 @@ EExit RunTranscode(const COptions& options)
         if (!motion.Save(output, options.frameScale))
             return Fail(output, motion.Record().Failure());
         return TellWritten(options, source, output);
+    }
+    if (const char* const words = WhyNoBVH(motion))
+    {
+        SayReport(options, ShellFailure(source, "no-bvh", words));
+        return EExit::Failed;
     }
     TKBVHStream stream(motion);
     if (!stream.WriteFile(output))

@@ -379,7 +379,7 @@ TEST(CSafeFile, AGateHoldsBackWhatWouldTakeItsName)
     const CTempFolder folder;
     const CPrivateFile intermediate(folder.Path("walk.Kinetra"), ".htr");
     int asked = 0;
-    CSafeFile::SetCommitGate([&] { return ++asked > 1; });
+    CSafeFile::SetCommitGate([&](const std::string&) { return ++asked > 1; });
     EXPECT_TRUE(Save(intermediate.Path(), "new"));
     EXPECT_EQ(asked, 0);
     EXPECT_FALSE(Save(folder.Path("walk.Kinetra"), "new"));

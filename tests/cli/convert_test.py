@@ -136,12 +136,23 @@ class Convert(CliTest):
                 self.assertEqual(self.made(), [])
                 self.assertEqual((self.read("old.Kinetra"), self.read("old.htr")), (OLD, OLD))
 
+    def test_a_result_that_cannot_fit_is_refused_before_the_work(self):
+        self.write("slow.prf", profile("Slow", [("Hips", "LowerTorso")], rate=1))  # 120 rows for each frame
+        rows = "0 90 0 0 0 0 0 0 0\n"
+        self.write("long.bvh", BVH.split("Frames")[0] + "Frames: 15000\nFrame Time: 0.0333333\n" + 15000 * rows)
+        result = self.with_assets("convert", "long.bvh", "--profile", "slow.prf")
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["long.bvh: the result would take at least", "split the motion"])
+
     @unittest.skipIf(os.geteuid() == 0, "root may write everywhere")
     def test_a_folder_that_takes_no_file_is_said(self):
         locked = self.folder / "locked"
         locked.mkdir(mode=0o500)
         self.assertEqual(self.with_assets("convert", "walk.bvh", "-o", "locked/a.Kinetra").code, FAILED)
         self.assertEqual(self.made(), [])
+        locked.chmod(0o300)  # nor can it be listed
+        for command in (["convert", "locked", "--out-dir", "out"], ["batch", "locked", "--job", "htr"]):
+            self.assert_words(self.with_assets(*command), ["locked", "the folder cannot be read"])
 
     def test_nothing_of_the_users_settings_is_written(self):
         self.succeed("convert", "walk.bvh", "-o", "a.htr")

@@ -136,7 +136,8 @@ class Doctor(CliTest):
 
     def test_names_cannot_command_a_terminal(self):
         self.write("ill.bvh", bvh("JOINT Chest", "JOINT My\x9b Chest"))
-        self.assertNotIn("\x9b", self.run_program("doctor", "ill.bvh").out)
+        for option in ([], ["--json"]):
+            self.assertNotIn("\x9b", self.run_program("doctor", "ill.bvh", *option).out)
 
 
 if __name__ == "__main__":

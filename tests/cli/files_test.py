@@ -229,6 +229,18 @@ class Poses(CliTest):
                     self.assertAlmostEqual(x, y, places=4)
         self.assertEqual(self.run_program("transcode", "take.bvh", "again.bvh").code, FAILED)
 
+    def test_no_bvh_is_written_that_no_program_could_play(self):
+        head, _ = BVH.split("Frames: 3")
+        rows = [("no frames", head + "Frames: 0\nFrame Time: 0.1\n"),
+                ("no time", BVH.replace("0.0333333", "0")),
+                ("a time of less than six digits", BVH.replace("0.0333333", "1e-7"))]
+        for what, text in rows:
+            with self.subTest(what):
+                self.write("take.bvh", text)
+                result = self.run_program("transcode", "take.bvh", "again.bvh")
+                self.assertEqual((result.code, self.files()), (FAILED, ["take.bvh"]))
+                self.assertIn("take.bvh:", result.err)
+
 
 if __name__ == "__main__":
     main()

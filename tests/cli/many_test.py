@@ -165,6 +165,10 @@ class Told(CliTest):
                 result = self.with_assets("compare", *arguments)
                 self.assertEqual((result.code, result.out), (FAILED, ""))
                 self.assert_words(result, words)
+        self.succeed("convert", WALK, "-o", "a.Kinetra")
+        full = self.with_assets("compare", WALK, "a.Kinetra", "--profile", "Poser BVH", file_limit=4096)
+        self.assertEqual(full.code, FAILED)
+        self.assert_words(full, ["temporary file", "TMPDIR"])
 
 
 if __name__ == "__main__":

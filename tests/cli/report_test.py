@@ -145,7 +145,10 @@ class Page(ReportTest):
         result = self.with_assets("compare", WALK, "a.htr", *POSER, "--html", "page.html", "--force", file_limit=9000)
         self.assertEqual(result.code, FAILED)
         self.assert_words(result, ["page.html", "cannot be written"])
-        self.assertEqual((self.files(), self.read("page.html")), (before, OLD.encode()))
+        self.environment["TMPDIR"] = str(self.folder / "none")  # where a page's parts wait
+        result = self.with_assets("compare", WALK, "a.htr", *POSER, "--html", "page.html", "--force")
+        self.assert_words(result, ["page.html", "temporary files"])
+        self.assertEqual((result.code, self.files(), self.read("page.html")), (FAILED, before, OLD.encode()))
 
     def test_nothing_is_written_for_nothing(self):
         self.write("broken.bvh", BVH.replace("Frames: 3", "Frames: 30"))

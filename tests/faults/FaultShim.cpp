@@ -174,6 +174,11 @@ int fsync(int file)
     return IsDue(EOperation::Sync) ? Refuse(EIO) : static_cast<int>(syscall(SYS_fsync, file));
 }
 
+int syncfs(int file)
+{
+    return IsDue(EOperation::Sync) ? Refuse(EIO) : static_cast<int>(syscall(SYS_syncfs, file));
+}
+
 int fchmod(int file, mode_t mode)
 {
     return IsDue(EOperation::Mode) ? Refuse(EPERM) : static_cast<int>(syscall(SYS_fchmod, file, mode));

@@ -74,7 +74,7 @@ def batch(job, sources, extension):
     results = [name[:-4] + extension for name in sources]
     files = {**sources, **{name: OLD for name in results}, "small.prf": SMALL}
     return Case("batch to " + job, command, files, results,
-                ["takes/", ".prf", "base.htr", "KsBone.bsm", "not enough memory"])
+                ["takes", ".prf", "base.htr", "KsBone.bsm", "not enough memory"])
 
 
 def save(kind, path, content):

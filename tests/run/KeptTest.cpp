@@ -85,14 +85,18 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
     const std::string odd = "odd\xff\tname.Kinetra";
     CResumeState first;
     ASSERT_TRUE(first.Open(folder.Path(), "shard-0"));
-    EXPECT_TRUE(first.AddBegun("begun.Kinetra"));
-    EXPECT_TRUE(first.AddMade(odd, "key", "digits", R"("outcome":"converted")"));
+    EXPECT_TRUE(first.AddReady("ready.Kinetra", "digits", "1.5"));
+    EXPECT_TRUE(first.AddMade(odd, "key", "digits", "1.5", R"("outcome":"converted")"));
     CResumeState other;
     ASSERT_TRUE(other.Open(folder.Path(), "shard-1"));
-    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "old digits", "old"));
-    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "digits", "new"));
+    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "old digits", "1.5", "old"));
+    EXPECT_TRUE(other.AddSynced());
+    EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "digits", "2.5", "new"));
     WriteText(folder.Path(".gaitwright.resume.torn.jsonl"),
               "{\"output\":\"torn.Kin\n[[[[\n\n17\n{\"output\":5,\"key\":\"key\"}\n");
+    WriteText(folder.Path(".gaitwright.resume.old.jsonl"),
+              "{\"output\":\"begun.Kinetra\"}\n{\"output\":\"old.Kinetra\"}\n{\"output\":\"old.Kinetra\","
+              "\"key\":\"key\",\"digits\":\"digits\",\"told\":\"told\"}\n");
     WriteText(folder.Path("other.jsonl"), "{\"output\":\"strange.Kinetra\"}\n");
 
     CResumeState next;
@@ -105,8 +109,30 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
     EXPECT_EQ(told("made.Kinetra", "key", "digits"), "new");
     EXPECT_EQ(told("made.Kinetra", "key", "old digits"), "old");
     EXPECT_EQ(told("made.Kinetra", "other key", "digits"), "nothing");
-    EXPECT_EQ(told("begun.Kinetra", "key", "digits"), "nothing");
+    EXPECT_EQ(told("ready.Kinetra", "key", "digits"), "nothing");
+    EXPECT_EQ(told("made.Kinetra", "key", ""), "nothing");
     EXPECT_TRUE(next.Knows("begun.Kinetra"));
+    EXPECT_TRUE(next.HasUnsynced());
+    const struct
+    {
+        const char* what;
+        const char* output;
+        const char* digits;
+        const char* modified;
+        bool own;
+    } rows[] = {
+        {"about to take its place",        "ready.Kinetra", "digits",     "9.9", true },
+        {"torn by a power failure",        "ready.Kinetra", "torn",       "1.5", true },
+        {"edited",                         "ready.Kinetra", "edited",     "9.9", false},
+        {"an older result",                "made.Kinetra",  "old digits", "9.9", true },
+        {"edited, with its time put back", "made.Kinetra",  "edited",     "1.5", false},
+        {"torn behind the last sync",      "made.Kinetra",  "torn",       "2.5", true },
+        {"made by an earlier version",     "old.Kinetra",   "digits",     "1.5", true },
+        {"edited since then",              "old.Kinetra",   "edited",     "",    false},
+        {"only begun by it",               "begun.Kinetra", "edited",     "",    false},
+    };
+    for (const auto& row : rows)
+        EXPECT_EQ(next.IsOwn(row.output, row.digits, row.modified), row.own) << row.what;
     EXPECT_TRUE(next.Knows(odd));
     EXPECT_FALSE(next.Knows("torn.Kin"));
     EXPECT_FALSE(next.Knows("strange.Kinetra"));
