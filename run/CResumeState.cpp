@@ -1,11 +1,10 @@
 #include "CResumeState.h"
 
+#include "CJsonMembers.h"
 #include "CMappedFile.h"
 #include "JsonText.h"
 #include "Paths.h"
 #include "Text.h"
-
-#include <nlohmann/json.hpp>
 
 #include <algorithm>
 
@@ -13,15 +12,13 @@ namespace gw {
 
 namespace {
 
-using Json = nlohmann::ordered_json;
-
 constexpr std::string_view kPrefix = ".gaitwright.resume.";
 constexpr std::string_view kExtension = ".jsonl";
 
 // A name as the state knows it: JSON, which keeps no bytes that are no UTF-8.
 std::string Kept(const std::string& output)
 {
-    return DumpJson(Json(output));
+    return JsonString(output);
 }
 
 } // namespace
@@ -53,14 +50,14 @@ void CResumeState::ReadFile(const std::string& path)
 
 void CResumeState::TakeLine(std::string_view line)
 {
-    const Json json = Json::parse(line, nullptr, false);
+    CJsonMembers json;
     std::string output;
-    if (!TakeText(json, "output", output))
+    if (json.Read(line) != EJsonFault::None || !json.TakeText("output", output))
         return;
     std::vector<Made>& made = m_kMade[Kept(output)];
     Made entry;
-    if (TakeText(json, "key", entry.key) && TakeText(json, "digits", entry.digits) &&
-        TakeText(json, "told", entry.told))
+    if (json.TakeText("key", entry.key) && json.TakeText("digits", entry.digits) &&
+        json.TakeText("told", entry.told))
         made.push_back(std::move(entry));
 }
 
@@ -82,20 +79,14 @@ const std::string* CResumeState::FindTold(const std::string& output, const std::
 
 bool CResumeState::AddBegun(const std::string& output)
 {
-    return m_kFile.AddLine(DumpJson(Json{
-        {"output", output}
-    }));
+    return m_kFile.AddLine(CJsonLine().Add("output", output).Text());
 }
 
 bool CResumeState::AddMade(const std::string& output, const std::string& key, const std::string& digits,
                            const std::string& told)
 {
-    return m_kFile.AddLine(DumpJson(Json{
-        {"output", output},
-        {"key",    key   },
-        {"digits", digits},
-        {"told",   told  }
-    }));
+    return m_kFile.AddLine(
+        CJsonLine().Add("output", output).Add("key", key).Add("digits", digits).Add("told", told).Text());
 }
 
 } // namespace gw
