@@ -74,6 +74,8 @@ constexpr Words<EFailure> kFailures[] = {
     Row(CutName, "cut-name", "a name cannot be used as it stands and was changed"),
     Row(OpenHeader, "open-header", "no empty line closes the header, so the motion has no frames",
         "put an empty line behind the header"),
+    Row(SkippedPicture, "skipped-picture",
+        "a linked picture was not read: the pictures are too large together", "link smaller pictures"),
 };
 
 constexpr Words<EMisfit> kMisfits[] = {

@@ -47,6 +47,8 @@ enum class EFailure : uint8_t
     UnknownChannel, ///< a channel name that is not one of the nine
     CutName,        ///< a name that was not usable as it stands
     OpenHeader,     ///< a header that nothing closes, so that the motion behind it has no frame
+    SkippedPicture, ///< a linked picture that was not decoded, because the scene's pictures take too much
+                    ///< memory
 };
 
 /// One thing that failed or that a user should know.

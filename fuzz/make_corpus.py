@@ -1,6 +1,7 @@
 """Makes the seeds of the fuzz targets: small files of every kind, which mutations begin from.
 
     make_corpus.py PROJECT_FOLDER CORPUS_FOLDER"""
+import json
 import struct
 import sys
 from pathlib import Path
@@ -96,6 +97,32 @@ def maps():
                        "odd": '; note\n[Settings]\nLastFolder="a, b;\\x41\\n" ; tail\nk%20y=1,2, 3\n[%General]\n'}
 
 
+def lines(*records):
+    return "".join(json.dumps(record, separators=(",", ":")) + "\n" for record in records)
+
+
+def nested(levels):
+    return "[" * levels + "]" * levels + "\n"
+
+
+def runs():
+    head = {"plan": 1, "version": "1", "shards": 2, "outputFolder": "out", "options": {}}
+    told = {"--profile": "Poser BVH", "--no-legs": True, "--jobs": 4, "--rate": 30.5, "--sixty": 7}
+    source = {"shard": 1, "source": "a\u00e9.bvh", "output": "out/a.Kinetra", "bytes": 4096}
+    deep = nested(70000)
+    yield "plan", {"small": lines(head, source), "options": lines(head | {"options": told}, source),
+                   "empty": lines(head), "deep": lines(head, source)[:-2] + ',"x":' + deep, "first": deep}
+    begun = {"output": "a.Kinetra"}
+    done = begun | {"key": "a key", "digits": "0f" * 16, "told": '"outcome":"converted"'}
+    yield "resume", {"small": lines(begun, done), "torn": lines(done, done)[:-20], "deep": lines(done) + deep}
+    failure = {"path": "a.bvh", "where": 7, "code": "bad-number", "name": "1x", "words": "a number is expected"}
+    result = {"source": "a.bvh", "output": "a.Kinetra", "outcome": "converted", "check": {"figures": {"slide": 0.5}},
+              "failures": [failure], "warnings": [failure, failure]}
+    clean = result | {"failures": [], "warnings": []}
+    yield "report", {"small": lines(result), "clean": lines(clean, result), "torn": lines(result)[:-9],
+                     "deep": lines(result)[:-2] + ',"x":' + deep}
+
+
 def pictures():
     yield "bmp", {"%d" % depth: bmp(depth, palette=1 << depth if depth <= 8 else 0) for depth in (1, 4, 8, 16, 24, 32)} | {
         "top": bmp(24, height=-4), "large-head": bmp(8, palette=256, header=124)}
@@ -105,7 +132,7 @@ def pictures():
 
 
 def main():
-    kinds = [*motions(), *maps(), *pictures(), ("container", dict(scenes()))]
+    kinds = [*motions(), *maps(), *runs(), *pictures(), ("container", dict(scenes()))]
     for target, seeds in kinds:
         folder = CORPUS / target
         folder.mkdir(parents=True, exist_ok=True)

@@ -1,11 +1,10 @@
 #include "CResumeState.h"
 
+#include "CJsonMembers.h"
 #include "CMappedFile.h"
 #include "JsonText.h"
 #include "Paths.h"
 #include "Text.h"
-
-#include <nlohmann/json.hpp>
 
 #include <algorithm>
 
@@ -15,8 +14,6 @@ namespace gw {
 
 namespace {
 
-using Json = nlohmann::ordered_json;
-
 constexpr std::string_view kPrefix = ".gaitwright.resume.";
 constexpr std::string_view kExtension = ".jsonl";
 constexpr std::string_view kSynced = R"({"synced":true})"; // no text in JSON can contain it
@@ -24,7 +21,7 @@ constexpr std::string_view kSynced = R"({"synced":true})"; // no text in JSON ca
 // A name as the state knows it: JSON, which keeps no bytes that are no UTF-8.
 std::string Kept(const std::string& output)
 {
-    return DumpJson(Json(output));
+    return JsonString(output);
 }
 
 } // namespace
@@ -58,18 +55,18 @@ void CResumeState::ReadFile(const std::string& path)
 
 void CResumeState::TakeLine(std::string_view line, bool isSynced)
 {
-    const Json json = Json::parse(line, nullptr, false);
+    CJsonMembers json;
     std::string output;
-    if (!TakeText(json, "output", output))
+    if (json.Read(line) != EJsonFault::None || !json.TakeText("output", output))
         return;
     std::vector<Made>& made = m_kMade[Kept(output)];
     Made entry;
-    if (!TakeText(json, "digits", entry.digits))
+    if (!json.TakeText("digits", entry.digits))
         return;
-    if (!TakeText(json, "key", entry.key) || !TakeText(json, "told", entry.told))
+    if (!json.TakeText("key", entry.key) || !json.TakeText("told", entry.told))
         entry.key.clear();
     // Earlier versions synced each result before its line.
-    if (!isSynced && TakeText(json, "modified", entry.modified))
+    if (!isSynced && json.TakeText("modified", entry.modified))
         m_bUnsynced = true;
     made.push_back(std::move(entry));
 }
@@ -101,23 +98,20 @@ const std::string* CResumeState::FindTold(const std::string& output, const std::
 
 bool CResumeState::AddReady(const std::string& output, const std::string& digits, const std::string& modified)
 {
-    return m_kFile.AddLine(DumpJson(Json{
-        {"output",   output  },
-        {"digits",   digits  },
-        {"modified", modified}
-    }));
+    return m_kFile.AddLine(
+        CJsonLine().Add("output", output).Add("digits", digits).Add("modified", modified).Text());
 }
 
 bool CResumeState::AddMade(const std::string& output, const std::string& key, const std::string& digits,
                            const std::string& modified, const std::string& told)
 {
-    return m_kFile.AddLine(DumpJson(Json{
-        {"output",   output  },
-        {"key",      key     },
-        {"digits",   digits  },
-        {"modified", modified},
-        {"told",     told    }
-    }));
+    return m_kFile.AddLine(CJsonLine()
+                               .Add("output", output)
+                               .Add("key", key)
+                               .Add("digits", digits)
+                               .Add("modified", modified)
+                               .Add("told", told)
+                               .Text());
 }
 
 bool CResumeState::AddSynced()

@@ -1,5 +1,6 @@
 #include "CRunPlan.h"
 
+#include "CJsonMembers.h"
 #include "CMappedFile.h"
 #include "CSafeFile.h"
 #include "JsonText.h"
@@ -14,43 +15,32 @@ namespace gw {
 
 namespace {
 
-using Json = nlohmann::ordered_json;
-
-constexpr int kPlanVersion = 1;
+constexpr uint64_t kPlanVersion = 1;
 // What a file costs beside its bytes (opening, syncing, the skeleton), in bytes that take as long.
 constexpr uint64_t kFileCost = 16'384;
 constexpr size_t kShardLimit = 1'000'000;
 
-bool TakeCount(const Json& json, const char* key, uint64_t& count)
-{
-    const auto found = json.is_object() ? json.find(key) : json.end();
-    if (found == json.end() || !found->is_number_unsigned())
-        return false;
-    count = found->get<uint64_t>();
-    return true;
-}
-
-bool TakeHead(const Json& json, CRunPlan& plan)
+bool TakeHead(const CJsonMembers& json, CRunPlan& plan)
 {
     uint64_t planVersion = 0;
     uint64_t shardCount = 0;
-    if (!TakeCount(json, "plan", planVersion) || planVersion != kPlanVersion ||
-        !TakeText(json, "version", plan.version) || !TakeText(json, "outputFolder", plan.outputFolder) ||
-        !TakeCount(json, "shards", shardCount) || shardCount == 0 || shardCount > kShardLimit)
+    if (!json.TakeCount("plan", planVersion) || planVersion != kPlanVersion ||
+        !json.TakeText("version", plan.version) || !json.TakeText("outputFolder", plan.outputFolder) ||
+        !json.TakeCount("shards", shardCount) || shardCount == 0 || shardCount > kShardLimit)
         return false;
     plan.shardCount = shardCount;
-    const auto options = json.find("options");
-    plan.options = options != json.end() ? DumpJson(*options) : "{}";
-    return true;
+    const CJsonMembers::Member* const options = json.Find("options");
+    plan.options = options ? options->text : "{}";
+    return !options || options->kind == CJsonMembers::EKind::Nested;
 }
 
-bool TakeEntry(const Json& json, CRunPlan& plan)
+bool TakeEntry(const CJsonMembers& json, CRunPlan& plan)
 {
     CRunPlan::Entry entry;
     uint64_t shard = 0;
-    if (!TakeText(json, "source", entry.source) || !TakeText(json, "output", entry.output) ||
-        !TakeCount(json, "shard", shard) || shard >= plan.shardCount ||
-        !TakeCount(json, "bytes", entry.byteCount))
+    if (!json.TakeText("source", entry.source) || !json.TakeText("output", entry.output) ||
+        !json.TakeCount("shard", shard) || shard >= plan.shardCount ||
+        !json.TakeCount("bytes", entry.byteCount))
         return false;
     entry.shard = shard;
     plan.entries.push_back(std::move(entry));
@@ -90,21 +80,21 @@ std::vector<CRunPlan::Entry> CRunPlan::Shard(size_t shard) const
 bool WritePlan(const std::string& path, const CRunPlan& plan)
 {
     CSafeFile file;
-    bool good = file.Open(path) && file.Write(DumpJson(Json{
-                                                  {"plan",         kPlanVersion             },
-                                                  {"version",      plan.version             },
-                                                  {"shards",       plan.shardCount          },
-                                                  {"outputFolder", plan.outputFolder        },
-                                                  {"options",      Json::parse(plan.options)}
-    }) +
+    bool good = file.Open(path) && file.Write(CJsonLine()
+                                                  .Add("plan", kPlanVersion)
+                                                  .Add("version", plan.version)
+                                                  .Add("shards", plan.shardCount)
+                                                  .Add("outputFolder", plan.outputFolder)
+                                                  .AddJson("options", plan.options)
+                                                  .Text() +
                                               '\n');
     for (const CRunPlan::Entry& entry : plan.entries)
-        good = good && file.Write(DumpJson(Json{
-                                      {"shard",  entry.shard    },
-                                      {"source", entry.source   },
-                                      {"output", entry.output   },
-                                      {"bytes",  entry.byteCount}
-        }) +
+        good = good && file.Write(CJsonLine()
+                                      .Add("shard", entry.shard)
+                                      .Add("source", entry.source)
+                                      .Add("output", entry.output)
+                                      .Add("bytes", entry.byteCount)
+                                      .Text() +
                                   '\n');
     return good && file.Commit();
 }
@@ -115,17 +105,19 @@ EPlanFault ReadPlan(const std::string& path, CRunPlan& plan, size_t& line)
     if (file.Open(path) != EFailure::None)
         return EPlanFault::Unreadable;
     std::string_view rest = file.Text();
-    std::string_view text;
-    line = 1;
-    if (!NextLine(rest, text) || !TakeHead(Json::parse(text, nullptr, false), plan))
-        return EPlanFault::NoPlan;
-    while (NextLine(rest, text))
+    line = 0;
+    for (std::string_view text; NextLine(rest, text);)
     {
         ++line;
-        if (!TakeEntry(Json::parse(text, nullptr, false), plan))
+        CJsonMembers json;
+        if (json.Read(text) == EJsonFault::TooDeep)
+            return EPlanFault::TooDeep;
+        if (line == 1 && !TakeHead(json, plan))
+            return EPlanFault::NoPlan;
+        if (line > 1 && !TakeEntry(json, plan))
             return EPlanFault::BadLine;
     }
-    return EPlanFault::None;
+    return line > 0 ? EPlanFault::None : EPlanFault::NoPlan;
 }
 
 } // namespace gw

@@ -40,6 +40,7 @@ enum class EPlanFault : uint8_t
     Unreadable, ///< there is no such file
     NoPlan,     ///< its first line is none of a plan
     BadLine,    ///< another line is none, or names a shard that there is not
+    TooDeep,    ///< a line is nested deeper than any plan
 };
 
 /// Reads a plan. `line` becomes the one that was refused, from 1 on.

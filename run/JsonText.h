@@ -2,24 +2,34 @@
 
 #include <nlohmann/json.hpp>
 
+#include <cstdint>
 #include <string>
+#include <string_view>
 
 namespace gw {
 
-/// A member of a JSON object that is to be a text. False for any other.
-inline bool TakeText(const nlohmann::ordered_json& json, const char* key, std::string& text)
+/// A text as a JSON string. Bytes that are not UTF-8 become U+FFFD.
+inline std::string JsonString(std::string_view text)
 {
-    const auto found = json.is_object() ? json.find(key) : json.end();
-    if (found == json.end() || !found->is_string())
-        return false;
-    text = found->get<std::string>();
-    return true;
+    return nlohmann::json(text).dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
 }
 
-/// A JSON value on one line. Bytes that are no UTF-8 become U+FFFD.
-inline std::string DumpJson(const nlohmann::ordered_json& json)
+/// One JSON object on one line, made without a tree, which takes memory when it is dropped.
+class CJsonLine
 {
-    return json.dump(-1, ' ', false, nlohmann::json::error_handler_t::replace);
-}
+public:
+    CJsonLine& Add(std::string_view key, std::string_view text) { return AddJson(key, JsonString(text)); }
+    CJsonLine& Add(std::string_view key, uint64_t count) { return AddJson(key, std::to_string(count)); }
+    /// Adds a member whose value is JSON already.
+    CJsonLine& AddJson(std::string_view key, std::string_view json)
+    {
+        m_kText.append(m_kText.size() > 1 ? "," : "").append(JsonString(key)).append(":").append(json);
+        return *this;
+    }
+    std::string Text() const { return m_kText + '}'; }
+
+private:
+    std::string m_kText = "{";
+};
 
 } // namespace gw

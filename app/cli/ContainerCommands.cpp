@@ -37,6 +37,7 @@ EExit RunResave(const COptions& options)
     COrrinStream scene;
     if (!MayWrite(options, output) || !LoadWhole(scene, source))
         return EExit::Failed;
+    SayWarnings(options, source, scene.Record());
     if (!scene.SaveFile(output))
         return Fail(output, scene.Record().Failure().reason);
     return TellWritten(options, source, output);

@@ -124,6 +124,7 @@ EExit RunInfo(const COptions& options)
 {
     const std::string& path = options.files[0];
     CSceneFile file;
+    file.Scene().SetPictureLimit(0); // names are all that is printed of linked pictures
     if (!file.Load(path))
     {
         SayFailure(path, file.Failure());

@@ -3,7 +3,6 @@
 #include "CSafeFile.h"
 #include "Commands.h"
 #include "FailureWords.h"
-#include "JsonText.h"
 #include "Output.h"
 #include "PlanFile.h"
 #include "ReportJson.h"
@@ -28,19 +27,18 @@ struct ReportLineOf
 
 using Lines = std::unordered_map<std::string, ReportLineOf>; // by output
 
-// Half a line of a run that was killed is none.
-void TakeLine(std::string_view text, Lines& lines)
+// A line that a killed run left cut is skipped. One that is nested too deeply was not written by a run.
+bool TakeLine(std::string_view text, Lines& lines)
 {
-    const auto json = nlohmann::ordered_json::parse(text, nullptr, false);
     std::string output;
     std::string outcome;
-    if (!TakeText(json, "output", output) || !TakeText(json, "outcome", outcome))
-        return;
+    const EJsonFault fault = ReadReportLine(text, output, outcome);
     for (const EConversion end : {EConversion::Converted, EConversion::Skipped, EConversion::Failed})
     {
-        if (outcome == OutcomeName(end))
+        if (fault == EJsonFault::None && outcome == OutcomeName(end))
             lines[output] = {std::string(text), end};
     }
+    return fault != EJsonFault::TooDeep;
 }
 
 bool ReadReport(const std::string& path, Lines& lines)
@@ -49,8 +47,14 @@ bool ReadReport(const std::string& path, Lines& lines)
     if (file.Open(path) != EFailure::None)
         return false;
     std::string_view rest = file.Text();
+    size_t number = 0;
     for (std::string_view line; NextLine(rest, line);)
-        TakeLine(line, lines);
+    {
+        ++number;
+        if (!TakeLine(line, lines))
+            SayError(Printable(path) + ':' + std::to_string(number) +
+                     ": this line is nested deeper than a report can be, and was skipped");
+    }
     return true;
 }
 

@@ -1,5 +1,6 @@
 #include "OptionJson.h"
 
+#include "CJsonMembers.h"
 #include "JsonText.h"
 #include "OptionTable.h"
 
@@ -9,7 +10,7 @@ namespace gw {
 
 namespace {
 
-using Json = nlohmann::ordered_json;
+using Json = nlohmann::json; // for single values: nothing here builds a tree
 
 // What a member of the record can be. The size of a picture is nothing that a conversion asks for.
 template <class T>
@@ -35,7 +36,9 @@ struct COptionValue
 
 struct COptionTaker
 {
-    const Json& value;
+    using EKind = CJsonMembers::EKind;
+
+    const CJsonMembers::Member& value;
     COptions& options;
 
     template <Plain T>
@@ -53,12 +56,21 @@ struct COptionTaker
     template <Plain T>
     bool Take(T& member) const
     {
-        const bool fits = std::same_as<T, bool>          ? value.is_boolean()
-                          : std::same_as<T, std::string> ? value.is_string()
-                          : std::same_as<T, float>       ? value.is_number()
-                                                         : value.is_number_integer();
+        if constexpr (std::same_as<T, bool>)
+            return Take(member, value.flag, value.kind == EKind::Bool);
+        else if constexpr (std::same_as<T, std::string>)
+            return Take(member, value.text, value.kind == EKind::Text);
+        else if constexpr (std::same_as<T, int64_t>)
+            return Take(member, value.integer, value.kind == EKind::Integer);
+        else
+            return Take(member, static_cast<float>(value.number),
+                        value.kind == EKind::Integer || value.kind == EKind::Number);
+    }
+    template <Plain T>
+    bool Take(T& member, const T& found, bool fits) const
+    {
         if (fits)
-            member = value.get<T>();
+            member = found;
         return fits;
     }
 };
@@ -72,27 +84,27 @@ std::string FirstName(const COptionRow& row)
 
 std::string OptionsJson(const COptions& options, uint64_t bits)
 {
-    Json json = Json::object();
+    CJsonLine json;
     for (const COptionRow& row : OptionTable())
     {
         const Json value = bits & row.bit ? std::visit(COptionValue{options}, row.target) : Json();
         if (!value.is_null())
-            json[FirstName(row)] = value;
+            json.AddJson(FirstName(row), value.dump(-1, ' ', false, Json::error_handler_t::replace));
     }
-    return DumpJson(json);
+    return json.Text();
 }
 
 bool ReadOptionsJson(std::string_view text, uint64_t bits, COptions& options, std::string& wrong)
 {
-    const Json json = Json::parse(text, nullptr, false);
-    if (!json.is_object())
+    CJsonMembers json;
+    json.Read(text);
+    if (!json.IsObject())
         return false;
-    for (const auto& [name, value] : json.items())
+    for (const CJsonMembers::Member& value : json.Members())
     {
-        const auto row = std::ranges::find_if(OptionTable(), [bits, &name = name](const COptionRow& r) {
-            return (bits & r.bit) && FirstName(r) == name;
-        });
-        wrong = name;
+        const auto row = std::ranges::find_if(
+            OptionTable(), [&](const COptionRow& r) { return (bits & r.bit) && FirstName(r) == value.key; });
+        wrong = value.key;
         if (row == OptionTable().end() || !std::visit(COptionTaker{value, options}, row->target))
             return false;
     }

@@ -1,3 +1,4 @@
+#include "CJsonMembers.h"
 #include "CJsonWriter.h"
 #include "CRunPlan.h"
 #include "Commands.h"
@@ -23,12 +24,10 @@ constexpr int64_t kShardLimit = 1'000'000;
 // A plan is JSON, which keeps no other names.
 bool IsUtf8(const std::string& text)
 {
+    CJsonMembers json;
     std::string kept;
-    return TakeText(nlohmann::ordered_json::parse(DumpJson({
-                        {"text", text}
-    })),
-                    "text", kept) &&
-           kept == text;
+    json.Read(CJsonLine().Add("text", text).Text());
+    return json.TakeText("text", kept) && kept == text;
 }
 
 bool MakePlan(const COptions& options, const CFileRun::Jobs& jobs, CRunPlan& plan)

@@ -14,7 +14,10 @@ std::string FaultWords(const std::string& path, EPlanFault fault, size_t line)
         return path + ": the plan cannot be read (check the path and the permissions)";
     if (fault == EPlanFault::NoPlan)
         return path + ": this is no plan; 'gaitwright plan' makes one";
-    return path + ':' + std::to_string(line) + ": this line is no source of a plan; make the plan again";
+    const std::string place = path + ':' + std::to_string(line);
+    if (fault == EPlanFault::TooDeep)
+        return place + ": this line is nested deeper than a plan can be; make the plan again";
+    return place + ": this line is no source of a plan; make the plan again";
 }
 
 } // namespace

@@ -1,17 +1,16 @@
 #include "ReportJson.h"
 
 #include "CFailure.h"
+#include "CJsonMembers.h"
 #include "CJsonWriter.h"
 #include "CReport.h"
 #include "FailureWords.h"
-#include "JsonText.h"
 
 namespace gw {
 
 namespace {
 
-// As WriteReports has it. Most records are so; and what the library has parsed takes memory again when it is
-// dropped, and ends the program where there is none.
+// Most records end like this, as WriteReports writes it, and need not be parsed.
 constexpr std::string_view kNoReports = R"("failures":[],"warnings":[])";
 
 void WriteReport(CJsonWriter& json, const CReport& report)
@@ -25,18 +24,30 @@ void WriteReport(CJsonWriter& json, const CReport& report)
     json.EndObject();
 }
 
-CReport ReadReport(const nlohmann::ordered_json& json, bool warning)
+CReport ReadReport(std::string_view text, bool warning)
 {
+    CJsonMembers json;
+    json.Read(text);
     CReport report;
     report.warning = warning;
-    TakeText(json, "path", report.path);
-    TakeText(json, "code", report.code);
-    TakeText(json, "name", report.name);
-    TakeText(json, "words", report.words);
-    const auto where = json.is_object() ? json.find("where") : json.end();
-    if (where != json.end() && where->is_number_unsigned())
-        report.where = where->get<size_t>();
+    json.TakeText("path", report.path);
+    json.TakeText("code", report.code);
+    json.TakeText("name", report.name);
+    json.TakeText("words", report.words);
+    uint64_t where = 0;
+    if (json.TakeCount("where", where))
+        report.where = where;
     return report;
+}
+
+// The elements of a member that is an array.
+std::vector<CJsonMembers::Member> ReadList(const CJsonMembers& json, std::string_view key)
+{
+    CJsonMembers list;
+    const CJsonMembers::Member* const member = json.Find(key);
+    if (member && member->text.starts_with('[') && member->kind == CJsonMembers::EKind::Nested)
+        list.Read(member->text);
+    return list.Members();
 }
 
 } // namespace
@@ -69,14 +80,24 @@ bool ReadReports(std::string_view text, std::vector<CReport>& reports)
 {
     if (text.find(kNoReports) != text.npos)
         return true;
-    const auto json = nlohmann::ordered_json::parse(text, nullptr, false);
+    CJsonMembers json;
+    json.Read(text);
     for (const bool warning : {false, true})
     {
-        const auto found = json.is_object() ? json.find(warning ? "warnings" : "failures") : json.end();
-        for (size_t i = 0; found != json.end() && found->is_array() && i < found->size(); ++i)
-            reports.push_back(ReadReport((*found)[i], warning));
+        for (const CJsonMembers::Member& report : ReadList(json, warning ? "warnings" : "failures"))
+            reports.push_back(ReadReport(report.text, warning));
     }
-    return json.is_object();
+    return json.IsObject();
+}
+
+EJsonFault ReadReportLine(std::string_view text, std::string& output, std::string& outcome)
+{
+    CJsonMembers json;
+    const EJsonFault fault = json.Read(text);
+    if (fault != EJsonFault::None)
+        return fault;
+    return json.TakeText("output", output) && json.TakeText("outcome", outcome) ? EJsonFault::None
+                                                                                : EJsonFault::NotJson;
 }
 
 } // namespace gw

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "CJsonMembers.h"
+
 #include <string>
 #include <string_view>
 #include <vector>
@@ -17,5 +19,7 @@ void WriteRecord(CJsonWriter& json, const std::string& path, const CFailureRecor
 /// Takes the reports back out of an object with those members, behind what is there already. False where the
 /// text is no JSON object.
 bool ReadReports(std::string_view text, std::vector<CReport>& reports);
+/// Takes the output and the outcome from a line of a run's report. NotJson for any other line.
+EJsonFault ReadReportLine(std::string_view text, std::string& output, std::string& outcome);
 
 } // namespace gw

@@ -2,6 +2,7 @@
 
 #include <algorithm>
 #include <array>
+#include <new>
 
 namespace gw {
 
@@ -152,7 +153,7 @@ bool BuildShape(CBoneMesh& mesh, float length, std::span<const Vec3> points,
         return false;
     if (!mesh.SetPointCount(static_cast<int32_t>(points.size())) ||
         !mesh.SetTriangleQuantity(static_cast<int32_t>(triangles.size())))
-        return false;
+        throw std::bad_alloc(); // as for any part of a skeleton: without its length, it would convert wrongly
     mesh.m_fLength = length;
     std::ranges::transform(points, mesh.XYZBuffer().begin(),
                            [=](const Vec3& point) { return point * length; });

@@ -83,7 +83,7 @@ uint64_t CAnmImage::GetMemoryUsed() const
     return CObject::GetMemoryUsed() + 8 + m_kLink.MemoryUsed() + m_kFrames.size() * kFrameBytes;
 }
 
-bool CAnmImage::Load(const std::string& path)
+bool CAnmImage::Load(const std::string& path, CLinkedPictures* memory)
 {
     m_kFrames.clear();
     const auto take = [&](const CPictureHead& head) -> CPixelBuffer& {
@@ -94,7 +94,7 @@ bool CAnmImage::Load(const std::string& path)
         frame.m_spkImage = new CImage;
         return frame.m_spkImage->Pixels();
     };
-    const bool good = ReadFrames(path, take);
+    const bool good = ReadFrames(path, take, memory);
     if (!good)
         m_kFrames.clear();
     return good;

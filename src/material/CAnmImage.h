@@ -40,9 +40,9 @@ public:
     bool Register(COrrinStream& stream) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Reads all frames of an animated file, each into an image of its own. False, with an empty film, when
-    /// it cannot be read.
-    bool Load(const std::string& path);
+    /// Reads all frames of an animated file, each into its own image. False, with an empty film, if it cannot
+    /// be read or there is no room for it.
+    bool Load(const std::string& path, CLinkedPictures* memory = nullptr);
 
     size_t GetFrameCount() const { return m_kFrames.size(); }
     /// The frame; out of range one without an image.
@@ -52,6 +52,7 @@ public:
 
     /// The file that the film stands for, or null for an embedded one.
     const char* GetLinkFileName() const { return m_kLink.GetFileName(); }
+    CPictureLink& PictureLink() { return m_kLink; }
     /// Null or an empty text make the film an embedded one. Nothing is read.
     void SetLinkFileName(const char* name) { m_kLink.Set(name, *this); }
 

@@ -140,8 +140,13 @@ bool CBMPPicture::ReadRowBytes(int y, int x, int count)
     if (!m_bReading || !IsInside(y, x, count, Box()))
         return false;
     const int row = m_kInput.IsStream() && !m_bTopDown ? m_iHeight - y - 1 : y;
-    return m_kInput.Seek(m_kFileHeader.offset + uint64_t{m_uiRowSize} * static_cast<uint64_t>(row)) &&
-           m_kInput.Read(std::as_writable_bytes(std::span(m_kRow)));
+    if (row == m_iHeldRow)
+        return true; // a pipe cannot go back to it
+    if (!m_kInput.Seek(m_kFileHeader.offset + uint64_t{m_uiRowSize} * static_cast<uint64_t>(row)))
+        return false;
+    const bool read = m_kInput.Read(std::as_writable_bytes(std::span(m_kRow)));
+    m_iHeldRow = read ? row : -1;
+    return read;
 }
 
 // The first pixel is in the high bits.

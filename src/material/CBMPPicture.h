@@ -39,8 +39,8 @@ struct CBMPInfoHeader
 
 /// A BMP file, read or written row by row. Uncompressed files of all depths are read, in both directions: a
 /// file that stands bottom up gives its bottom row as row 0, unless it comes as a stream, where row 0 is the
-/// top one. Rows of a stream that cannot go back must be asked for in the order in which they stand. Written
-/// are files of one channel or three, from the top row on.
+/// top one. A stream that cannot go back returns its rows in file order only; the last row stays readable,
+/// whole or in pieces. Files are written with one channel or three, from the top row down.
 class CBMPPicture : public CPicture
 {
 public:
@@ -92,6 +92,7 @@ private:
     int m_iChannels = 3;
     int m_iRow = 0;               // the row that is written next
     uint32_t m_uiRowSize = 0;     // bytes of a row in the file
+    int m_iHeldRow = -1;          // the file's row that m_kRow holds while reading, or -1
     std::vector<uint8_t> m_kRow;  // the row at hand, as in the file
     CPicInput m_kInput;           // of a picture that is read
     std::FILE* m_pkOut = nullptr; // of one that is written

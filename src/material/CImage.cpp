@@ -100,10 +100,10 @@ void CImage::MakeJPEG()
     m_uiJPEGRevision = m_kPixels.GetRevision();
 }
 
-bool CImage::Load(const std::string& path)
+bool CImage::Load(const std::string& path, CLinkedPictures* memory)
 {
     m_bDecoded = true;
-    return ReadPicture(path, m_kPixels);
+    return ReadPicture(path, m_kPixels, memory);
 }
 
 bool CImage::Save(const std::string& path, int32_t quality)

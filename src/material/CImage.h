@@ -33,13 +33,15 @@ public:
     /// Makes the JPEG that Save writes. A picture that can be none is stored plainly from then on.
     uint64_t GetDiskUsed() const override;
 
-    /// Reads a picture file into the pixels. False, with an empty image, when it cannot be read.
-    bool Load(const std::string& path);
+    /// Reads a picture file into the pixels. False, with an empty image, if it cannot be read or there is no
+    /// room for it.
+    bool Load(const std::string& path, CLinkedPictures* memory = nullptr);
     /// Writes a picture file of the format that its extension tells; quality goes from 1 to 100.
     bool Save(const std::string& path, int32_t quality);
 
     /// The file that the image stands for, or null for an embedded one.
     const char* GetLinkFileName() const { return m_kLink.GetFileName(); }
+    CPictureLink& PictureLink() { return m_kLink; }
     /// Null or an empty text make the image an embedded one. Nothing is read.
     void SetLinkFileName(const char* name) { m_kLink.Set(name, *this); }
 

@@ -10,6 +10,7 @@ void CPictureLink::Set(const char* name, const CObject& owner)
         CImageCache::Instance().Remove(View(), &owner);
     m_pcFileName.Set(name && *name ? name : nullptr);
     m_pcStoredName.Set(nullptr);
+    m_bUnread = false;
 }
 
 void CPictureLink::Field(CFieldArchive& archive)

@@ -18,6 +18,9 @@ public:
     CPictureLink& operator=(const CPictureLink&) = delete;
 
     bool IsNull() const { return m_pcFileName.IsNull(); }
+    /// Whether the file was left unread by the load that found the link. Setting a name clears it.
+    bool IsUnread() const { return m_bUnread; }
+    void SetUnread(bool unread) { m_bUnread = unread; }
     const char* GetFileName() const { return m_pcFileName.Get(); }
     std::string_view View() const { return m_pcFileName.View(); }
     size_t MemoryUsed() const { return m_pcFileName.MemoryUsed(); }
@@ -32,12 +35,30 @@ public:
 private:
     CText m_pcFileName;
     CText m_pcStoredName; // null until a stream has told its folder
+    bool m_bUnread = false;
 };
 
-/// What reading a linked picture ends with: the stored name becomes the path that it means, and the file is
-/// read. A picture of the same class that has this path already takes the new one's place in the stream, and
-/// the new one lives no longer. A file that cannot be read leaves a note beside the container. In a stream
-/// without a folder the name stays as it is.
+/// Reads the file of a linked picture, unless an earlier load has. If the scene's pictures take too much
+/// memory, this one stays unread, with a warning. A file that cannot be read leaves a note beside the
+/// container.
+template <class T>
+void ReadLinkedFile(T& picture, COrrinStream& stream)
+{
+    CLinkedPictures& memory = stream.LinkedPictures();
+    if (!picture.PictureLink().IsUnread() || memory.m_uiByteLimit == 0)
+        return;
+    const std::string path = picture.GetLinkFileName();
+    const bool isRead = !memory.m_bFull && picture.Load(path, &memory);
+    if (memory.m_bFull)
+        return stream.Warn(EFailure::SkippedPicture, path);
+    picture.PictureLink().SetUnread(false);
+    if (!isRead)
+        NoteFailedLink(stream.GetBaseDirectory(), picture.NameView(), path);
+}
+
+/// The last step of loading a linked picture: resolves the stored name to a path and reads the file. If a
+/// picture of the same class already has this path, it replaces the new one in the stream, and the new one is
+/// destroyed. In a stream without a folder the name stays as it is.
 template <class T>
 void FollowLink(T& picture, COrrinStream& stream, CLinkRecord& record)
 {
@@ -51,11 +72,14 @@ void FollowLink(T& picture, COrrinStream& stream, CLinkRecord& record)
     const std::string path = ResolveLinkName(stream.GetBaseDirectory(), name);
     CImageCache& cache = CImageCache::Instance();
     if (T* known = cache.Find<T>(path))
-        return stream.Substitute(record, *known);
+    {
+        stream.Substitute(record, *known);
+        return ReadLinkedFile(*known, stream);
+    }
     picture.SetLinkFileName(path.c_str());
+    picture.PictureLink().SetUnread(true);
     cache.Enter(path, picture);
-    if (!picture.Load(path))
-        NoteFailedLink(stream.GetBaseDirectory(), picture.NameView(), path);
+    ReadLinkedFile(picture, stream);
 }
 
 } // namespace gw

@@ -46,6 +46,15 @@ std::string Join(const std::string& folder, std::string_view name)
     return folder.empty() ? path : folder + kPathSeparator + path;
 }
 
+// A path without . and .. parts if it still is the same file: one file, one text. After a linked folder, ..
+// leads elsewhere.
+std::string ShortestPath(const std::string& path)
+{
+    std::error_code error;
+    const std::string normal = fs::path(path).lexically_normal().string();
+    return fs::equivalent(normal, path, error) ? normal : path;
+}
+
 fs::path Normal(const std::string& path)
 {
     std::error_code error;
@@ -66,7 +75,7 @@ std::string ResolveLinkName(const std::string& folder, std::string_view name)
     if (!IsFromRoot(name))
         return Join(folder, name.substr(name.find_first_of(kSeparators) + 1)); // npos + 1 is 0
     if (IsRegularFile(std::string(name)))
-        return std::string(name);
+        return ShortestPath(std::string(name));
     return Join(folder, LastPart(name));
 }
 

@@ -1,6 +1,7 @@
 #include "PictureFile.h"
 
 #include "CMappedFile.h"
+#include "COrrinStream.h"
 #include "CPixelBuffer.h"
 #include "CSafeFile.h"
 #include "Paths.h"
@@ -16,6 +17,8 @@ using namespace std::string_view_literals;
 namespace gw {
 
 namespace {
+
+constexpr uint64_t kFrameObjectBytes = 512; // the image object of a frame, which may have one pixel
 
 constexpr const char* kCodecModule = "gw_picture_codec.so";
 
@@ -89,11 +92,25 @@ CPictureCodec* OpenCodec()
     return entry ? reinterpret_cast<CPictureCodecEntry>(entry)() : nullptr;
 }
 
-bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame, const CFrameTaker& take)
+// Counts a picture's pixels before they come; false if the scene's pictures would take too much.
+bool Reserve(CLinkedPictures& memory, const CPictureHead& head, bool everyFrame)
+{
+    const uint64_t pixels = static_cast<uint64_t>(head.width) * static_cast<uint64_t>(head.height);
+    const uint64_t bytes = 4 * pixels + (everyFrame ? kFrameObjectBytes : 0);
+    memory.m_bFull = bytes > memory.m_uiByteLimit - memory.m_uiBytesUsed;
+    memory.m_uiBytesUsed += memory.m_bFull ? 0 : bytes;
+    return !memory.m_bFull;
+}
+
+bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame, CLinkedPictures* memory,
+            const CFrameTaker& take)
 {
     CPictureCodec* codec = format ? LoadPictureCodec() : nullptr;
     std::optional<CPixelLock> lock;
+    const uint64_t usedBefore = memory ? memory->m_uiBytesUsed : 0;
     const auto place = [&](const CPictureHead& head) -> uint8_t* {
+        if (memory && !Reserve(*memory, head, everyFrame))
+            return nullptr;
         lock.reset();
         CPixelBuffer& pixels = take(head);
         if (!pixels.SetRowAlignment(false) || !pixels.Create(head.width, head.height, 0))
@@ -102,15 +119,19 @@ bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame
             pixels.SetResolution(head.horizontalResolution, head.verticalResolution);
         return lock.emplace(pixels).Bytes().data();
     };
-    return codec && codec->Decode(file, format, everyFrame, place);
+    const bool good = codec && codec->Decode(file, format, everyFrame, place);
+    if (!good && memory)
+        memory->m_uiBytesUsed = usedBefore; // the caller frees what came
+    return good;
 }
 
-bool DecodeOne(std::span<const std::byte> file, const char* format, CPixelBuffer& pixels)
+bool DecodeOne(std::span<const std::byte> file, const char* format, CLinkedPictures* memory,
+               CPixelBuffer& pixels)
 {
     if (!pixels.Free())
         return false;
     const bool good =
-        Decode(file, format, false, [&](const CPictureHead&) -> CPixelBuffer& { return pixels; });
+        Decode(file, format, false, memory, [&](const CPictureHead&) -> CPixelBuffer& { return pixels; });
     if (!good)
         pixels.Free();
     return good;
@@ -137,23 +158,23 @@ CPictureCodec* LoadPictureCodec()
     return codec;
 }
 
-bool ReadPicture(const std::string& path, CPixelBuffer& pixels)
+bool ReadPicture(const std::string& path, CPixelBuffer& pixels, CLinkedPictures* memory)
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
-    return DecodeOne(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, pixels);
+    return DecodeOne(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, memory, pixels);
 }
 
-bool ReadFrames(const std::string& path, const CFrameTaker& take)
+bool ReadFrames(const std::string& path, const CFrameTaker& take, CLinkedPictures* memory)
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
-    return Decode(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, true, take);
+    return Decode(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, true, memory, take);
 }
 
 bool DecodeJPEG(std::span<const uint8_t> file, CPixelBuffer& pixels)
 {
-    return DecodeOne(std::as_bytes(file), "JPEG", pixels);
+    return DecodeOne(std::as_bytes(file), "JPEG", nullptr, pixels);
 }
 
 bool EncodePicture(const CPixelBuffer& pixels, std::string_view extension, int32_t quality,

@@ -13,6 +13,7 @@
 namespace gw {
 
 class CPixelBuffer;
+struct CLinkedPictures;
 
 /// The codec of this machine, loaded at the first call; null where its module does not lie beside the
 /// program.
@@ -22,10 +23,11 @@ CPictureCodec* LoadPictureCodec();
 using CFrameTaker = std::function<CPixelBuffer&(const CPictureHead&)>;
 
 /// Reads a picture file into a buffer, 4 bytes a pixel. What it begins with tells the format, else its
-/// extension. False, with the buffer empty, for what is no regular file, no picture, or too large.
-bool ReadPicture(const std::string& path, CPixelBuffer& pixels);
+/// extension. False, with the buffer empty, for what is no regular file, no picture, or too large. If the
+/// memory of a scene's pictures is given, the pixels count there, and a picture that exceeds it is not read.
+bool ReadPicture(const std::string& path, CPixelBuffer& pixels, CLinkedPictures* memory = nullptr);
 /// Reads every frame of a film, or the one of a picture. False when any of it could not be taken.
-bool ReadFrames(const std::string& path, const CFrameTaker& take);
+bool ReadFrames(const std::string& path, const CFrameTaker& take, CLinkedPictures* memory = nullptr);
 /// The picture in the bytes of a JPEG file.
 bool DecodeJPEG(std::span<const uint8_t> file, CPixelBuffer& pixels);
 

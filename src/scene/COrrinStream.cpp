@@ -179,6 +179,7 @@ bool COrrinStream::LoadThumbnailOnly(std::span<const std::byte> bytes, size_t po
 bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
 {
     m_kRecord.Clear();
+    m_kLinkedPictures = {.m_uiByteLimit = m_kLinkedPictures.m_uiByteLimit};
     RemoveAllRoots();
     if (position == 0)
         m_kVersion = kNewestVersion;

@@ -14,6 +14,7 @@
 #include <string>
 #include <unordered_map>
 #include <unordered_set>
+#include <utility>
 #include <vector>
 
 namespace gw {
@@ -29,6 +30,18 @@ struct CLinkRecord
     Ref<CObject> m_spkObject;   ///< kept alive until the links stand
     bool m_bSubstitute = false; ///< an object that was there before stands for the one in the file
     std::vector<uint32_t> m_kLinkID;
+};
+
+/// How much memory the linked pictures of one scene take, of how much they may.
+struct CLinkedPictures
+{
+    /// Room for one picture of 64 megapixels, the largest that the codec reads, or for four of 4096 x 4096.
+    /// Without a limit, a scene of a few KB could take 256 MiB for each picture file of 200 KB that it names.
+    static constexpr uint64_t kByteLimit = uint64_t{256} << 20;
+
+    uint64_t m_uiByteLimit = kByteLimit;
+    uint64_t m_uiBytesUsed = 0;
+    bool m_bFull = false; ///< one picture did not fit; the rest of the scene's pictures are not tried
 };
 
 /// Containers are at most this large, read or written: offsets in them are signed 32-bit.
@@ -78,6 +91,9 @@ public:
     /// What the last load or save failed on, with the byte and the class.
     const CFailureRecord& Record() const { return m_kRecord; }
 
+    /// Sets how many bytes the linked pictures of each scene may take. 0 decodes none and reports none.
+    void SetPictureLimit(uint64_t bytes) { m_kLinkedPictures.m_uiByteLimit = bytes; }
+
     /// All objects that the roots hold, in save order, for reports. Empty between operations otherwise.
     std::vector<CObject*> ObjectsInSaveOrder();
 
@@ -100,6 +116,10 @@ public:
     void Substitute(CLinkRecord& record, CObject& object);
     /// A fresh record for an object that is about to read itself; the stream owns it.
     CLinkRecord& NewLinkRecord(CObject& object);
+    /// The memory of the linked pictures that the load in progress has read.
+    CLinkedPictures& LinkedPictures() { return m_kLinkedPictures; }
+    /// Keeps a warning about the load in progress.
+    void Warn(EFailure reason, std::string name) { m_kRecord.Warn(reason, 0, std::move(name)); }
 
 private:
     bool ReadObjects();
@@ -124,6 +144,7 @@ private:
     std::unordered_map<const CObject*, uint32_t> m_kSaveID;
     std::string m_kBaseDirectory;
     bool m_bHasBaseDirectory = false;
+    CLinkedPictures m_kLinkedPictures;  // of the load in progress or the last one
     CMappedFile* m_pkFile = nullptr;    // while reading one
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing

@@ -65,6 +65,15 @@ class Containers(CliTest):
             self.assertEqual(chest["local"][12:15], [min(frame, 2), 10, 0])
             self.assertEqual(chest["world"][12:15], [min(frame, 2), 100, 7])
 
+    def test_info_reads_no_linked_picture(self):
+        name = b"none.png"
+        fields = struct.pack("<I", len(name)) + name + struct.pack("<H", 0)
+        self.write("a.orn", Container().record("CImage", 1, "", (0, 0, 0), fields, True).bytes)
+        self.succeed("info", "a.orn")
+        self.assertEqual(self.files(), ["a.orn"], "no note of a picture that cannot be read")
+        self.succeed("resave", "a.orn", "b.orn")
+        self.assertIn("ImageLoadFailed.txt", self.files())
+
     def test_every_object_is_told_with_links_and_fields(self):
         self.write("scene.orn", skeleton())
         told = json.loads(self.run_program("info", "scene.orn", "--json").out)

@@ -7,6 +7,7 @@ from made import BVH
 
 BROKEN = BVH.replace("Frames: 3", "Frames: 30")
 TAKES = 9
+DEEP = b'{"x":' + b"[" * 70_000 + b"]" * 70_000 + b"}\n"
 
 
 def without_time(text):
@@ -60,6 +61,16 @@ class Shards(CliTest):
         self.assertEqual(without_time(self.run_program("merge-report", "plan.jsonl").out.encode()),
                          without_time(whole.out.encode()))
 
+    def test_nested_lines_of_reports_and_of_what_was_done_are_skipped(self):
+        self.plan("--out-dir", "many", shards=1)
+        self.shard(0)
+        self.write("plan.shard-0.jsonl", DEEP + self.read("plan.shard-0.jsonl"))
+        self.write("many/.gaitwright.resume.deep.jsonl", DEEP)
+        merged = self.run_program("merge-report", "plan.jsonl", "-o", "all.jsonl")
+        self.assertIn("plan.shard-0.jsonl:1: this line is nested deeper", merged.err)
+        self.assertEqual(self.read("all.jsonl").count(b"\n"), TAKES)
+        self.assertIn("%d skipped" % (TAKES - 1), self.with_assets("run", "plan.jsonl", "--shard", 0).err)
+
     def test_another_division_knows_what_was_done(self):
         self.plan("--out-dir", "many")
         self.shard(0)
@@ -100,7 +111,9 @@ class Shards(CliTest):
             ("an option that is for the run", plan.replace(b'"options":{', b'"options":{"--jobs":3'), "--jobs"),
             ("a cut line", head + b"\n" + first[:-9] + b"\n" + rest, "wrong.jsonl:2:"),
             ("a shard that there is not", plan.replace(b'"shard":1', b'"shard":3'), "wrong.jsonl:"),
-            ("deep", b"[" * 100_000, "no plan"),
+            ("deep", b"[" * 100_000, "wrong.jsonl:1: this line is nested deeper"),
+            ("a deep line", plan + DEEP, "wrong.jsonl:%d: this line is nested deeper" % (TAKES + 2)),
+            ("deep options", plan.replace(b'"options":{', b'"options":{"--x":' + DEEP[5:-2]), "nested deeper"),
         ]
         for what, text, words in rows:
             with self.subTest(what):

@@ -3,6 +3,7 @@
 The shim counts the calls of a run and lets one of them fail; a test goes through all of them, and through a sample
 of the thousands of allocations."""
 import atexit
+import json
 import os
 import random
 import resource
@@ -68,6 +69,25 @@ def resave():
                 ["in.orn", "out.orn", "not enough memory"])
 
 
+def merge():
+    """A plan with options and a report with warnings: all kinds of lines that are nested."""
+    version = subprocess.run([PROGRAM, "--version"], capture_output=True, check=True).stdout.decode().split()[-1]
+    head = {"plan": 1, "version": version, "shards": 1, "outputFolder": "", "options": {"--no-legs": True}}
+    source = {"shard": 0, "source": "a.bvh", "output": "a.Kinetra", "bytes": 9}
+    warning = {"path": "a.bvh", "where": 7, "code": "short-row", "name": "Hips", "words": "a row is too short"}
+    line = {"output": "a.Kinetra", "outcome": "converted", "failures": [], "warnings": [warning] * 3}
+    files = {"plan.jsonl": json.dumps(head) + "\n" + json.dumps(source) + "\n", "one.jsonl": json.dumps(line) + "\n",
+             "all.jsonl": OLD}
+    command = [PROGRAM, "merge-report", "plan.jsonl", "one.jsonl", "-o", "all.jsonl", "--force"]
+    return Case("merge reports", command, files, ["all.jsonl"], [".jsonl", "not enough memory"])
+
+
+def plan():
+    command = [PROGRAM, "plan", "a.bvh", "--shards", 1, "-o", "plan.jsonl", "--force", "--no-legs"]
+    return Case("plan", command, {"a.bvh": BVH, "plan.jsonl": OLD}, ["plan.jsonl"],
+                ["a.bvh", "plan.jsonl", "not enough memory"])
+
+
 def batch(job, sources, extension):
     command = [PROGRAM, "batch", "takes", "--job", job, "--data-dir", DATA]
     command += ["--profile", "small.prf"] if job == "htr" else []
@@ -87,6 +107,8 @@ def cases():
     yield convert("out.htr")
     yield convert("out.Kinetra")
     yield resave()
+    yield plan()
+    yield merge()
     yield save("profile", "small.prf", SMALL)
     yield save("map", "small.map", SMALL)
     yield save("setting", "home/.config/Tessarine/Gaitwright.conf", "[Settings]\nOther=1\n")

@@ -195,12 +195,13 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
         std::string_view order;
         std::string_view rows;
     } cases[] = {
-        {"a file, bottom up",  3,  false, "012", "321"},
-        {"a file, top down",   -3, false, "012", "123"},
-        {"a file, back again", -3, false, "20",  "31" },
-        {"a pipe, top down",   -3, true,  "02",  "13" },
-        {"a pipe, bottom up",  3,  true,  "210", "123"},
-        {"a pipe, and back",   -3, true,  "10",  "20" },
+        {"a file, bottom up",  3,  false, "012",  "321" },
+        {"a file, top down",   -3, false, "012",  "123" },
+        {"a file, back again", -3, false, "20",   "31"  },
+        {"a pipe, top down",   -3, true,  "02",   "13"  },
+        {"a pipe, bottom up",  3,  true,  "210",  "123" },
+        {"a pipe, and back",   -3, true,  "101",  "202" },
+        {"a pipe, in pieces",  3,  true,  "2200", "1133"},
     };
     for (const auto& row : cases)
     {

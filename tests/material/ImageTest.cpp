@@ -60,6 +60,19 @@ TEST(PictureFiles, KeepAlphaWhereTheFormatHasIt)
     }
 }
 
+TEST(PictureFiles, PrintColorsBecomeScreenColors)
+{
+    using namespace std::string_literals;
+    const CTempFolder folder;
+    // One pixel of magenta and yellow, each plane by itself; 255 is no ink.
+    WriteBytes(folder.Path("red.psd"), "8BPS\0\1\0\0\0\0\0\0\0\4\0\0\0\1\0\0\0\1\0\x8\0\4"s +
+                                           std::string(14, '\0') + "\xff\0\0\xff"s);
+    const Ref<CImage> image = new CImage;
+    ASSERT_TRUE(image->Load(folder.Path("red.psd")));
+    const uint8_t red[4] = {0, 0, 255, 255};
+    EXPECT_EQ(std::memcmp(CPixelView(image->Pixels()).Row(0), red, 4), 0);
+}
+
 TEST(PictureFiles, WhatAFileBeginsWithTellsMoreThanItsName)
 {
     const CTempFolder folder;

@@ -91,6 +91,12 @@ TEST(LinkNames, LeadWhereTheRuleSays)
         EXPECT_EQ(ResolveLinkName("", row.name), row.path) << row.name;
     }
     EXPECT_EQ(ResolveLinkName("/scenes", there), there) << "a file from the root that is there";
+    CreateFolder(folder.Path("x/deep"));
+    EXPECT_EQ(ResolveLinkName("/scenes", folder.Path("x/.././there.png")), there) << "one name for one file";
+    std::filesystem::create_symlink("x/deep", folder.Path("y"));
+    WriteBytes(folder.Path("x/there.png"), "x");
+    EXPECT_EQ(ResolveLinkName("/scenes", folder.Path("y/../there.png")), folder.Path("y/../there.png"))
+        << "a linked folder, whose .. is another one";
     EXPECT_EQ(ResolveLinkName("/scenes", folder.Path()), "/scenes/") << "a folder is no file";
 }
 
@@ -164,6 +170,39 @@ TEST_F(LinkedImage, OfOnePathIsReadOnce)
     CImageCache::Instance().Enter("one", *renamed);
     renamed->SetLinkFileName("two");
     EXPECT_EQ(CImageCache::Instance().Find<CImage>("one"), nullptr);
+}
+
+TEST_F(LinkedImage, TakesNoMoreMemoryThanItsSceneMay)
+{
+    for (const char* name : {"two.png", "three.png"})
+        std::filesystem::copy_file(m_kFolder.Path("halves.png"), m_kFolder.Path(name));
+    for (const std::string_view className : {"CImage", "CAnmImage"})
+    {
+        COrrinStream stream;
+        stream.SetPictureLimit(2 * 16 * 8 * 4 + (className == "CImage" ? 0 : 2 * 512));
+        ASSERT_TRUE(
+            Load(stream, {"none.png", "halves.png", "two.png", "three.png", "x\\three.png"}, className));
+        ASSERT_EQ(stream.Record().Warnings().size(), 2u) << "both places of the one that is left out";
+        EXPECT_EQ(stream.Record().Warnings()[0].reason, EFailure::SkippedPicture);
+        EXPECT_EQ(stream.Record().Warnings()[0].name, m_kFolder.Path("three.png"));
+        ASSERT_TRUE(stream.SaveFile(m_kFolder.Path("b.orn")));
+        EXPECT_EQ(ReadBytes(m_kFolder.Path("b.orn")),
+                  LinkingScene({"none.png", "halves.png", "two.png", "three.png"}, className));
+        COrrinStream second;
+        ASSERT_TRUE(Load(second, {"three.png"}, className));
+        EXPECT_EQ(second.GetRoot(0), stream.GetRoot(3));
+        EXPECT_TRUE(second.Record().Warnings().empty());
+        const auto* film = dynamic_cast<CAnmImage*>(stream.GetRoot(3));
+        CImage& image = film ? *film->GetFrame(0).m_spkImage : ImageAt(stream, 3);
+        EXPECT_TRUE(ShowsHalves(image, 0)) << "read for the scene that has room for it";
+    }
+    COrrinStream names;
+    names.SetPictureLimit(0);
+    std::filesystem::remove(m_kFolder.Path(kNote));
+    ASSERT_TRUE(Load(names, {"halves.png", "none.png"}));
+    EXPECT_TRUE(ImageAt(names, 0).Pixels().IsEmpty());
+    EXPECT_EQ(ImageAt(names, 0).GetLinkFileName(), m_kFolder.Path("halves.png"));
+    EXPECT_TRUE(names.Record().Warnings().empty() && !FileExists(m_kFolder.Path(kNote)));
 }
 
 TEST_F(LinkedImage, KeepsWhatItHoldsWhenAnotherContainerMeetsIt)

@@ -88,12 +88,21 @@ void MakeOpaque(uint8_t* pixels, size_t count)
         *alpha = 255;
 }
 
+// The export below copies the channels as they are: cyan would come out as red.
+void ConvertToSRGB(Magick::Image& image)
+{
+    const Magick::ColorspaceType space = image.colorSpace();
+    if (space != Magick::sRGBColorspace && space != Magick::GRAYColorspace)
+        image.colorSpace(Magick::sRGBColorspace);
+}
+
 bool HandOver(Magick::Image& image, const CPictureSink& sink)
 {
     const CPictureHead head = HeadOf(image);
     uint8_t* const pixels = head.width > 0 && head.height > 0 ? sink(head) : nullptr;
     if (!pixels)
         return false;
+    ConvertToSRGB(image);
     image.write(0, 0, image.columns(), image.rows(), "BGRA", Magick::CharPixel, pixels);
     if (!image.matte())
         MakeOpaque(pixels, image.columns() * image.rows());

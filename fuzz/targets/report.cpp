@@ -1,0 +1,60 @@
+// Lines of a run's report: the failures and warnings of each survive being written and read again.
+
+#include "CJsonWriter.h"
+#include "CReport.h"
+#include "FuzzTarget.h"
+#include "ReportJson.h"
+#include "Text.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <cstdlib>
+
+namespace gw {
+
+namespace {
+
+std::string Written(const std::vector<CReport>& reports)
+{
+    char* text = nullptr;
+    size_t size = 0;
+    std::FILE* const file = open_memstream(&text, &size);
+    {
+        CJsonWriter json(file);
+        json.BeginObject();
+        WriteReports(json, reports);
+        json.EndObject();
+    }
+    std::fclose(file);
+    const std::string written(text, size);
+    std::free(text);
+    return written;
+}
+
+bool IsSame(const CReport& a, const CReport& b)
+{
+    return a.path == b.path && a.where == b.where && a.code == b.code && a.name == b.name &&
+           a.words == b.words && a.warning == b.warning;
+}
+
+void CheckLine(std::string_view line)
+{
+    std::string output, outcome;
+    std::vector<CReport> first, second;
+    const bool isLine = ReadReportLine(line, output, outcome) == EJsonFault::None;
+    const bool isObject = ReadReports(line, first);
+    Require(isObject || !isLine, "a line of a report is an object");
+    Require(ReadReports(Written(first), second), "what was written can be read");
+    Require(std::ranges::equal(first, second, IsSame), "reports survive");
+}
+
+} // namespace
+
+void FuzzOne(std::span<const std::byte> input)
+{
+    std::string_view rest = TextOf(input);
+    for (std::string_view line; NextLine(rest, line);)
+        CheckLine(line);
+}
+
+} // namespace gw
