@@ -128,6 +128,8 @@ public:
     void OnCntCommand(int code);
     void DeleteSelectedProfile();
     virtual void RefreshProfileList();
+    /// Reads the display names of the two stock profiles, by which PickStockProfile selects them.
+    void KeepStockNames();
     void PruneProfileList();
     virtual void SelectProfileByName(const std::string& name);
     /// Loads a profile that need not be in the list, as if it had been chosen there.
@@ -247,7 +249,7 @@ private:
     void ToggleProfileEditor();
 
     // ProfileList.cpp
-    std::string AddProfile(const std::string& path, int userData);
+    void AddProfile(const std::string& path, int userData);
     void ChooseProfile();
     void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);

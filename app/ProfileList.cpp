@@ -56,27 +56,26 @@ std::string CGaitConvertContent::FindProfilePath(const std::string& name)
 void CGaitConvertContent::RefreshProfileList()
 {
     m_pkProfileCombo->DeleteItem(-1);
+    KeepStockNames();
     const std::string stock = ExeFile({});
     for (const std::string& file : FilesInFolder(stock, kProfileExtension))
-    {
-        const std::string name = AddProfile(stock + file, kStock);
-        if (file == kPoserFile)
-            m_kPoserProfileName = name;
-        if (file == kMaxFile)
-            m_kMaxProfileName = name;
-    }
+        AddProfile(stock + file, kStock);
     const std::string custom = ProfileFile({});
     for (const std::string& file : FilesInFolder(custom, kProfileExtension))
         AddProfile(custom + file, kCustom);
 }
 
-// Adds a file's display name to the list and to the known names, and returns it.
-std::string CGaitConvertContent::AddProfile(const std::string& path, int userData)
+void CGaitConvertContent::KeepStockNames()
 {
-    std::string name = ReadProfileName(path);
+    m_kPoserProfileName = ReadProfileName(ExeFile(kPoserFile));
+    m_kMaxProfileName = ReadProfileName(ExeFile(kMaxFile));
+}
+
+void CGaitConvertContent::AddProfile(const std::string& path, int userData)
+{
+    const std::string name = ReadProfileName(path);
     m_pkProfileCombo->AddItem(name, userData);
     m_kProfileNames.push_back(name);
-    return name;
 }
 
 bool CGaitConvertContent::IsListed(const std::string& name) const

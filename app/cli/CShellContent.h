@@ -66,7 +66,7 @@ public:
     std::string FindProfilePath(const std::string& name) override;
     /// Reports a number outside its limits with its place in the profile's file.
     EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
-    void RefreshProfileList() override {}
+    void RefreshProfileList() override { KeepStockNames(); }
     void SelectProfileByName(const std::string& name) override;
     void PickStockProfile() override;
 

@@ -64,10 +64,11 @@ class Shards(CliTest):
     def test_nested_lines_of_reports_and_of_what_was_done_are_skipped(self):
         self.plan("--out-dir", "many", shards=1)
         self.shard(0)
-        self.write("plan.shard-0.jsonl", DEEP + self.read("plan.shard-0.jsonl"))
+        first, rest = self.read("plan.shard-0.jsonl").split(b"\n", 1)
+        self.write("plan.shard-0.jsonl", first + b"\n" + DEEP + rest)
         self.write("many/.gaitwright.resume.deep.jsonl", DEEP)
         merged = self.run_program("merge-report", "plan.jsonl", "-o", "all.jsonl")
-        self.assertIn("plan.shard-0.jsonl:1: this line is nested deeper", merged.err)
+        self.assertIn("plan.shard-0.jsonl:2: this line is nested deeper", merged.err)
         self.assertEqual(self.read("all.jsonl").count(b"\n"), TAKES)
         self.assertIn("%d skipped" % (TAKES - 1), self.with_assets("run", "plan.jsonl", "--shard", 0).err)
 

@@ -35,7 +35,7 @@ class Record:
         pack, size, fraction = NUMBERS[form]
         values = []
         for _ in range(size):
-            self.count = self.count % 7 + 1
+            self.count = self.count % 199 + 1
             values.append(1 if form == "bool" else self.count + fraction)
         values = [int(fixed)] if fixed else values
         self.content += struct.pack(pack, *values)
