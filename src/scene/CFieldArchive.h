@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CFailure.h"
+#include "CKeyArray.h"
 #include "CText.h"
 #include "CVersion.h"
 #include "Mat4.h"
@@ -177,6 +178,8 @@ public:
             return;
         Elements(name, values, Count(name, values.size(), sizeof(T)));
     }
+    template <class T>
+    void Block(const char* name, CKeyArray<T>& keys);
     /// The same with a signed count, of which those below 0 are none.
     template <class T>
     void SignedBlock(const char* name, std::vector<T>& values)
@@ -227,6 +230,8 @@ protected:
     explicit CFieldArchive(CVersion version) : m_kVersion(version), m_bReading(false), m_bLinksOnly(true) {}
 
     virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
+    /// The same value, so many times.
+    virtual void Repeated(const char* name, EFieldKind kind, const void* value, size_t count);
     virtual void Slot(const char* name, const CLinkSlot& slot) = 0;
     virtual void BeginArray(const char*, EListKind) {}
     virtual void EndArray() {}
@@ -260,6 +265,7 @@ public:
 
 protected:
     void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Repeated(const char* name, EFieldKind kind, const void* value, size_t count) override;
     void Slot(const char* name, const CLinkSlot& slot) override;
 
 private:
@@ -282,6 +288,21 @@ void CFieldArchive::Elements(const char* name, std::vector<T>& values, size_t co
         values.resize(std::min(count, start + kPiece));
         Values(name, FieldKind<T>(), values.data() + start, values.size() - start);
     }
+}
+
+template <class T>
+void CFieldArchive::Block(const char* name, CKeyArray<T>& keys)
+{
+    if (m_bLinksOnly)
+        return;
+    const size_t count = Count(name, keys.size(), sizeof(T));
+    if (!IsReading() && keys.Distinct().size() < count)
+        return Repeated(name, FieldKind<T>(), &keys.front(), count);
+    if (!IsReading())
+        return Elements(name, keys.Expand(), count);
+    std::vector<T> values;
+    Elements(name, values, count);
+    keys = std::move(values);
 }
 
 template <class T, class F>
