@@ -70,7 +70,8 @@ bool CBodyMap::HasFeet() const
 
 CBodyMap BodyOfTable(const CRetargeter& table, CNode& targetRoot)
 {
-    const auto source = [&](const char* target) { return table.SourceOf(FindNode(&targetRoot, target)); };
+    const CNodeNames targets(targetRoot);
+    const auto source = [&](const char* target) { return table.SourceOf(targets.Find(target)); };
     CBodyMap body;
     body.hip = source("LowerTorso");
     body.head = source("Head");

@@ -14,6 +14,13 @@ namespace gw {
 
 namespace {
 
+// Whether the last row finds its source.
+bool FindsSource(const CMapRowTable& rows, const CBoneNames& sources)
+{
+    const int last = rows.RowCount() - 1;
+    return last < 0 || rows.IsFixed(last) || sources.Find(rows.Text(last, kSourceColumn)) != nullptr;
+}
+
 void TakeLine(const CProfileLine& line, ProfileRows& profile)
 {
     switch (line.kind)
@@ -38,12 +45,31 @@ bool ReadProfileRows(const std::string& path, ProfileRows& profile)
     std::string text;
     if (!ReadProfileText(path, text))
         return false;
+    profile = RowsOfText(text);
+    return true;
+}
+
+ProfileRows RowsOfText(std::string_view text)
+{
     CProfileReader reader(text);
-    profile = {};
+    ProfileRows profile;
     profile.name = reader.Name();
     for (CProfileLine line; reader.Next(line);)
         TakeLine(line, profile);
     profile.rows.AddPelvisRows();
+    return profile;
+}
+
+bool NamesSourcesOf(std::string_view text, const CBoneNames& sources)
+{
+    CProfileReader reader(text);
+    ProfileRows profile;
+    for (CProfileLine line; reader.Next(line);)
+    {
+        TakeLine(line, profile);
+        if (!FindsSource(profile.rows, sources))
+            return false;
+    }
     return true;
 }
 

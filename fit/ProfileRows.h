@@ -22,6 +22,11 @@ struct ProfileRows
 
 /// Reads a profile. False, and the record left alone, when the file cannot be read.
 bool ReadProfileRows(const std::string& path, ProfileRows& profile);
+/// Reads the text of a profile.
+ProfileRows RowsOfText(std::string_view text);
+/// Whether all source bones that a profile names are there. Most profiles name one in their first rows that
+/// is not, and are read no further.
+bool NamesSourcesOf(std::string_view text, const CBoneNames& sources);
 /// The bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 

@@ -64,15 +64,16 @@ void LeadToFingers(Lead& hand)
 
 std::vector<Lead> FindLeads(const CRetargeter& table, CNode& targetRoot)
 {
+    const CNodeNames targets(targetRoot);
     std::vector<Lead> leads;
     for (const LeadRow& row : kLeads)
     {
-        CNode* const target = FindNode(&targetRoot, row.bone);
+        CNode* const target = targets.Find(row.bone);
         CNode* const source = table.SourceOf(target);
         if (!source)
             continue;
         leads.push_back({target, source, source, {}});
-        if (CNode* const next = row.next ? table.SourceOf(FindNode(&targetRoot, row.next)) : nullptr)
+        if (CNode* const next = row.next ? table.SourceOf(targets.Find(row.next)) : nullptr)
             leads.back().next = {next};
         if (row.isHand)
             LeadToFingers(leads.back());
