@@ -68,9 +68,8 @@ bool CBodyMap::HasFeet() const
     return std::ranges::all_of(legs, [](const BodyLeg& leg) { return leg.foot != nullptr; });
 }
 
-CBodyMap BodyOfTable(const CRetargeter& table, CNode& targetRoot)
+CBodyMap BodyOfTable(const CRetargeter& table, const CNodeNames& targets)
 {
-    const CNodeNames targets(targetRoot);
     const auto source = [&](const char* target) { return table.SourceOf(targets.Find(target)); };
     CBodyMap body;
     body.hip = source("LowerTorso");

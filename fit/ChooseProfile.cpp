@@ -4,6 +4,7 @@
 #include "FindBone.h"
 #include "ProfileFile.h"
 #include "SharedPrefix.h"
+#include "Skeleton.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -25,7 +26,7 @@ class CSkeletons
 {
 public:
     CSkeletons(CNode& source, CNode& target)
-        : m_kSource(source), m_kTarget(target), m_kSourceNames(&source), m_kTargetNames(&target)
+        : m_kSource(source), m_kTargetNodes(target), m_kSourceNames(&source), m_kTargetNames(&target)
     {
     }
 
@@ -44,7 +45,7 @@ private:
     }
 
     CNode& m_kSource;
-    CNode& m_kTarget;
+    CNodeNames m_kTargetNodes;
     CBoneNames m_kSourceNames;
     CBoneNames m_kTargetNames;
     std::optional<SourceBody> m_kBody;
@@ -60,7 +61,7 @@ void CSkeletons::Judge(ProfileChoice& choice)
 {
     CRetargeter table;
     ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
-    choice.verdict = JudgeProfile(table, m_kTarget, Body());
+    choice.verdict = JudgeProfile(table, m_kTargetNodes, Body());
 }
 
 // Larger is better. A profile of which rows do not fit is ranked by the share of those that do.
@@ -159,7 +160,7 @@ std::vector<ProfileChoice> ReadPromising(std::span<const LoadedProfile> profiles
 {
     std::vector<LoadedProfile> promising;
     std::ranges::copy_if(profiles, std::back_inserter(promising), [&](const LoadedProfile& profile) {
-        return NamesSourcesOf(profile.text, skeletons.Sources());
+        return MayFit(profile.text, skeletons.Sources());
     });
     return ReadAll(promising, skeletons);
 }

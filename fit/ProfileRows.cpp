@@ -8,18 +8,12 @@
 #include "SharedPrefix.h"
 #include "Text.h"
 
+#include <algorithm>
 #include <vector>
 
 namespace gw {
 
 namespace {
-
-// Whether the last row finds its source.
-bool FindsSource(const CMapRowTable& rows, const CBoneNames& sources)
-{
-    const int last = rows.RowCount() - 1;
-    return last < 0 || rows.IsFixed(last) || sources.Find(rows.Text(last, kSourceColumn)) != nullptr;
-}
 
 void TakeLine(const CProfileLine& line, ProfileRows& profile)
 {
@@ -60,15 +54,21 @@ ProfileRows RowsOfText(std::string_view text)
     return profile;
 }
 
-bool NamesSourcesOf(std::string_view text, const CBoneNames& sources)
+bool MayFit(std::string_view text, const CBoneNames& sources)
 {
     CProfileReader reader(text);
-    ProfileRows profile;
+    std::vector<std::string> targets; // a second row of one target does not change its source
+    const auto isKnown = [&](const std::string& target) {
+        return std::ranges::any_of(targets,
+                                   [&](const std::string& known) { return EqualNoCase(known, target); });
+    };
     for (CProfileLine line; reader.Next(line);)
     {
-        TakeLine(line, profile);
-        if (!FindsSource(profile.rows, sources))
-            return false;
+        if (line.kind != EProfileLine::Mapping && line.kind != EProfileLine::Fixed)
+            continue;
+        if (!EqualNoCase(line.source, kFixedSource) && !sources.Find(line.source))
+            return isKnown(line.target);
+        targets.push_back(std::move(line.target));
     }
     return true;
 }

@@ -24,9 +24,10 @@ struct ProfileRows
 bool ReadProfileRows(const std::string& path, ProfileRows& profile);
 /// Reads the text of a profile.
 ProfileRows RowsOfText(std::string_view text);
-/// Whether all source bones that a profile names are there. Most profiles name one in their first rows that
-/// is not, and are read no further.
-bool NamesSourcesOf(std::string_view text, const CBoneNames& sources);
+/// False if a profile names a source bone that does not exist, so that not all of its rows can fit. Most
+/// profiles name one in their first rows and are read no further. In rare cases true for such a profile as
+/// well.
+bool MayFit(std::string_view text, const CBoneNames& sources);
 /// The bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 

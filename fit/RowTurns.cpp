@@ -62,9 +62,8 @@ void LeadToFingers(Lead& hand)
         hand.next = {hand.source};
 }
 
-std::vector<Lead> FindLeads(const CRetargeter& table, CNode& targetRoot)
+std::vector<Lead> FindLeads(const CRetargeter& table, const CNodeNames& targets)
 {
-    const CNodeNames targets(targetRoot);
     std::vector<Lead> leads;
     for (const LeadRow& row : kLeads)
     {
@@ -131,12 +130,12 @@ bool HasLimbs(const CBodyMap& body)
 
 } // namespace
 
-std::vector<RowTurn> MeasureTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body)
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body)
 {
     if (!HasLimbs(body))
         return {};
     CBodyPoses poses(body);
-    const std::vector<Lead> leads = FindLeads(table, targetRoot);
+    const std::vector<Lead> leads = FindLeads(table, targets);
     std::vector<RowTurn> turns;
     for (const Lead& lead : leads)
     {
