@@ -32,6 +32,7 @@ inline constexpr Mat3 kMat3Identity{
     {1, 0, 0, 0, 1, 0, 0, 0, 1}
 };
 
+/// The product: a acts first.
 inline Mat3 operator*(const Mat3& a, const Mat3& b)
 {
     Mat3 out;
@@ -44,6 +45,7 @@ inline Mat3 operator*(const Mat3& a, const Mat3& b)
     return out;
 }
 
+/// The transpose, which is the inverse of a rotation.
 inline Mat3 Mat3Transpose(const Mat3& a)
 {
     return {

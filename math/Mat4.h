@@ -30,17 +30,21 @@ struct Mat4
 inline constexpr Mat4 kMat4Identity{
     {1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1, 0, 0, 0, 0, 1}
 };
+
 inline constexpr Mat4 kMat4Zero{};
+
 /// From the bones' frame to the limb solver's, and back: permutations with sign, inverse to each other.
 inline constexpr Mat4 AxisSwapForward{
     {0, -1, 0, 0, 0, 0, -1, 0, 1, 0, 0, 0, 0, 0, 0, 1}
 };
+
 inline constexpr Mat4 AxisSwapBack{
     {0, 0, 1, 0, -1, 0, 0, 0, 0, -1, 0, 0, 0, 0, 0, 1}
 };
 
 /// out := S · R · T. A null input stands for kMat3Identity, kVec3Zero, kVec3One.
 void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const Vec3* scale);
+
 inline Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scale = kVec3One)
 {
     const float* r = rotation.m;
@@ -53,6 +57,7 @@ inline Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec
 
 /// out := a · b; out may be a or b. With a null pointer nothing is written and null answered.
 Mat4* Mat4Multiply(Mat4* out, const Mat4* a, const Mat4* b);
+
 inline Mat4 operator*(const Mat4& a, const Mat4& b)
 {
     Mat4 out;
@@ -74,6 +79,7 @@ Mat4 Mat4InverseOrIdentity(const Mat4& m);
 
 /// (v, 1) · m, divided by its fourth element unless that is 1 within kEpsilon. Null for an absent pointer.
 Vec3* TransformCoord(Vec3* out, const Vec3* v, const Mat4* m);
+
 inline Vec3 TransformCoord(const Vec3& v, const Mat4& matrix)
 {
     const float* m = matrix.m;

@@ -21,12 +21,14 @@ struct Quat
 };
 
 inline constexpr Quat kQuatIdentity{1.0f, 0.0f, 0.0f, 0.0f};
+
 inline constexpr Quat kQuatZero{0.0f, 0.0f, 0.0f, 0.0f};
 
 /// All four components times s, with no renormalisation.
 void QuatScale(const Quat& q, float s, Quat& out);
 /// The matrix of a unit quaternion; the norm is not divided out.
 void QuatToMat3(const Quat& q, Mat3& out);
+
 inline Mat3 QuatToMat3(const Quat& q)
 {
     const float xx = q.x * q.x * 2.0f;
@@ -43,11 +45,13 @@ inline Mat3 QuatToMat3(const Quat& q)
          1.0f - (yy + xx)}
     };
 }
+
 /// The branch of QuatFromMat3 for rotations by half a turn or nearly so: starts from the largest diagonal
 /// element.
 Quat QuatFromLargestDiagonal(const Mat3& m);
 /// The quaternion of a matrix with orthonormal rows; the rows are not made so here.
 void QuatFromMat3(Quat& out, const Mat3& m);
+
 inline Quat QuatFromMat3(const Mat3& matrix)
 {
     const float* m = matrix.m;
@@ -60,6 +64,7 @@ inline Quat QuatFromMat3(const Mat3& matrix)
             static_cast<float>((static_cast<double>(m[6]) - m[2]) * k),
             static_cast<float>((static_cast<double>(m[1]) - m[3]) * k)};
 }
+
 /// From a at t = 0 to b at t = 1 the short way round. t is not clamped, the result is not normalised.
 void QuatSlerp(Quat& out, float t, const Quat& a, const Quat& b);
 Quat QuatSlerp(float t, const Quat& a, const Quat& b);
