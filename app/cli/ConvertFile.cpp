@@ -44,9 +44,9 @@ struct Account
     const char* whySkipped = "the output exists";
 };
 
-// Leaves a motion to the system, which takes back the memory of a process at once: freeing it object by object is
-// three percent of a small conversion. Only for what a process does last, and not for scenes, whose pictures may have
-// temporary files.
+// Leaves a motion to the system, which takes back the memory of a process at once: freeing it object by
+// object is three percent of a small conversion. Only for what a process does last, and not for scenes, whose
+// pictures may have temporary files.
 void KeepUntilExit(CNode* root)
 {
     static std::array<CNode*, 2> keptRoots{}; // what can still be reached is not a leak
