@@ -130,7 +130,7 @@ bench)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
   build release
   build/release/bin/gaitwright_bench
-  python3 bench/whole_process.py build/release/bin --what convert choose info
+  python3 bench/whole_process.py build/release/bin --what one four chosen faithful info choice
   python3 bench/growth.py build/release/bin
   ;;
 fuzz)

@@ -118,7 +118,7 @@ void CMotionAligner::AddKey(size_t index, int frame)
     m_kScales[index] = Scaled(above, RowLengths(local));
     const Vec3 once = joint.tellOnce ? joint.restOffset : kVec3Zero;
     const Vec3 position = Turned(Scaled(local.Translation() - once, above), ParentTurn(joint));
-    std::vector<Vec3>& keys = track.m_kPositionKeys;
+    CKeyArray<Vec3>& keys = track.m_kPositionKeys;
     const Vec3 still = keys.empty() ? track.m_kRestMatrix.Translation() : keys.front();
     const double same = (joint.tellOnce ? kSameRepeated : kSamePosition) * Vec3Length(still);
     const bool isStill = keys.size() <= 1 && Vec3Length(position - still) <= same;

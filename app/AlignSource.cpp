@@ -58,7 +58,7 @@ bool CGaitConvertContent::AlignSource(const SourceTiming& timing, EAlignedJoints
     m_kResultStamp.reset();
     CFailureRecord record;
     BodyMotion source{SourceRoot(), timing.frequency, FramesOf(timing, *SourceRoot(), record),
-                      BodyOfTable(*m_kRetargeter, target)};
+                      BodyOfTable(*m_kRetargeter, CNodeNames(target))};
     Report(m_kSourcePath, record);
     CompleteBody(source.body);
     Alignment alignment;

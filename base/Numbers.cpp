@@ -1,12 +1,10 @@
 // Numbers of text files, read and written as the C library does in the C locale, whatever the locale of the
 // desktop.
 //
-// Reading. Nearly every number in a motion file is a plain decimal such as -12.345678: its digits fit 53 bits
-// and its power of ten is exact in a double, so that one division gives the correctly rounded result (Clinger
-// 1990, "How to read floating point numbers accurately", the fast case). All others go through from_chars.
+// Reading. Plain decimals, which are nearly all, are read by ReadFloat; all others go through from_chars.
 //
-// Writing. A float is m * 2^e with m below 2^24, so that m * 10^6 fits 44 bits: six decimals are one shift
-// with the cut bits at hand for rounding, which is exact.
+// Writing. A float has 24 bits and 10^6 has 14 besides its powers of two, so that their product is exact in a
+// double, and six decimals take one rounding.
 
 #include "Numbers.h"
 
@@ -22,11 +20,6 @@
 namespace gw {
 
 namespace {
-
-constexpr double kPowersOfTen[] = {1e0,  1e1,  1e2,  1e3,  1e4,  1e5,  1e6,  1e7,  1e8,  1e9,
-                                   1e10, 1e11, 1e12, 1e13, 1e14, 1e15, 1e16, 1e17, 1e18, 1e19};
-constexpr ptrdiff_t kPlainDigits = 19; // what 64 bits always hold
-constexpr uint64_t kExactMantissa = uint64_t{1} << 53;
 
 bool IsDigit(char c)
 {
@@ -52,47 +45,6 @@ const char* SkipBlanks(const char* text, const char* end)
 const char* SkipPlus(const char* text, const char* end)
 {
     return end - text > 1 && text[0] == '+' && text[1] != '-' ? text + 1 : text;
-}
-
-// Adds the digits at a place to a number. It may wrap; the caller counts the digits.
-inline const char* TakeDigits(const char* text, const char* end, uint64_t& number)
-{
-    for (; text != end; ++text)
-    {
-        const unsigned digit = static_cast<unsigned char>(*text) - unsigned{'0'};
-        if (digit > 9)
-            break;
-        number = number * 10 + digit;
-    }
-    return text;
-}
-
-// The fast case. Answers the end of the number, or null where from_chars has to look. One digit at a time is
-// the fastest: the next number can only begin where this one ends, and the processor foresees the branches of
-// this loop, so that it works on both. (Eight digits at once without a branch: 17 ns a number; this: 10.)
-inline const char* ReadPlain(const char* text, const char* end, double& value)
-{
-    const bool negative = text != end && *text == '-';
-    const char* const first = text + negative;
-    uint64_t number = 0;
-    const char* next = TakeDigits(first, end, number);
-    ptrdiff_t count = next - first;
-    ptrdiff_t decimals = 0;
-    if (next != end && *next == '.')
-    {
-        const char* const point = next + 1;
-        next = TakeDigits(point, end, number);
-        decimals = next - point;
-        count += decimals;
-    }
-    if (count == 0 || count > kPlainDigits || number > kExactMantissa)
-        return nullptr;
-    if (next != end && ((*next | 0x20) == 'e' || (*next | 0x20) == 'x'))
-        return nullptr;
-    const double magnitude = static_cast<double>(static_cast<int64_t>(number)) / kPowersOfTen[decimals];
-    // No branch: signs come in no order.
-    value = std::bit_cast<double>(std::bit_cast<uint64_t>(magnitude) | uint64_t{negative} << 63);
-    return next;
 }
 
 int64_t ReadExponent(std::string_view text)
@@ -192,25 +144,10 @@ ENumber KindInRow(const char* next, const char* end)
     return next == end || *next == ' ' || *next == ',' || IsBlank(*next) ? ENumber::Whole : ENumber::Stuck;
 }
 
-// Apart from the fast case, whose registers it would take.
-[[gnu::noinline]] float ReadOddFloat(const char* text, const char* end, const char*& next, ENumber& kind)
-{
-    float value = 0.0f;
-    next = ReadAnyNarrowed(SkipBlanks(text, end), end, value);
-    if (!next)
-    {
-        next = text;
-        kind = ENumber::None;
-        return 0.0f;
-    }
-    kind = std::isfinite(value) ? KindInRow(next, end) : ENumber::Unusual;
-    return value;
-}
-
 // The numbers below 1000 as text, from the left, for what stands before the point and in threes behind it.
 struct CTriple
 {
-    char padded[3];
+    char padded[4]; // the fourth only fills a word, which is copied faster than three bytes
     char plain[3];
     uint8_t length;
 };
@@ -229,23 +166,15 @@ constexpr auto kTriples = [] {
     return rows;
 }();
 
-// The bits of a 32-bit float.
-constexpr int kMantissaBits = 23;
-constexpr int kExponentBias = 127;
-constexpr uint32_t kMantissaMask = (1u << kMantissaBits) - 1;
-// Numbers of 2^40 and above, infinities and NaN are rare and go through to_chars.
-constexpr int kIntegerLimit = 40;
-constexpr uint64_t kMillion = 1000000;
+// Larger numbers, infinities and NaN are rare and go through to_chars. A million times this is below 2^52.
+constexpr float kPlainLimit = 4294967296.0f;
+constexpr uint32_t kMillion = 1000000;
 
-// n / 2^shift, rounded to nearest, ties to even, for n below 2^44.
-uint64_t RoundedShift(uint64_t n, int shift)
+// A number below 2^52 rounded to the nearest integer, ties to even: next to 2^52 a double has no other bits.
+uint64_t Rounded(double number)
 {
-    if (shift > 45)
-        return 0;
-    const uint64_t quotient = n >> shift;
-    const uint64_t rest = n - (quotient << shift);
-    const uint64_t half = uint64_t{1} << (shift - 1);
-    return quotient + (rest > half || (rest == half && (quotient & 1)));
+    constexpr double kAllWhole = 4503599627370496.0;
+    return std::bit_cast<uint64_t>(number + kAllWhole) - std::bit_cast<uint64_t>(kAllWhole);
 }
 
 char* WriteWhole(char* out, uint64_t number)
@@ -305,36 +234,33 @@ bool ScanInt(std::string_view text, int32_t& value)
     return error != std::errc::invalid_argument;
 }
 
-float ReadFloat(const char* text, const char* end, const char*& next, ENumber& kind)
+float ReadOddFloat(const char* text, const char* end, const char*& next, ENumber& kind)
 {
-    double plain;
-    const char* const plainEnd = ReadPlain(text, end, plain);
-    if (!plainEnd)
-        return ReadOddFloat(text, end, next, kind);
-    next = plainEnd;
-    kind = KindInRow(plainEnd, end);
-    return static_cast<float>(plain);
+    float value = 0.0f;
+    next = ReadAnyNarrowed(SkipBlanks(text, end), end, value);
+    if (!next)
+    {
+        next = text;
+        kind = ENumber::None;
+        return 0.0f;
+    }
+    kind = std::isfinite(value) ? KindInRow(next, end) : ENumber::Unusual;
+    return value;
 }
 
 char* WriteFixed6(char* out, float value)
 {
-    const auto bits = std::bit_cast<uint32_t>(value);
-    const int biased = static_cast<int>(bits >> kMantissaBits & 0xff);
-    if (biased >= kExponentBias + kIntegerLimit)
+    if (!(std::fabs(value) < kPlainLimit))
         return std::to_chars(out, out + kFixed6Bytes, static_cast<double>(value), std::chars_format::fixed, 6)
             .ptr;
 
-    const uint32_t fraction = bits & kMantissaMask;
-    const uint64_t mantissa = biased ? fraction | 1u << kMantissaBits : fraction;
-    const int exponent = std::max(biased, 1) - kExponentBias - kMantissaBits;
-    const uint64_t millionths =
-        exponent >= 0 ? mantissa * kMillion << exponent : RoundedShift(mantissa * kMillion, -exponent);
+    const uint64_t millionths = Rounded(static_cast<double>(std::fabs(value)) * kMillion);
     *out = '-';
-    out = WriteWhole(out + (bits >> 31), millionths / kMillion);
-    const uint64_t decimals = millionths % kMillion;
+    out = WriteWhole(out + std::signbit(value), millionths / kMillion);
+    const auto decimals = static_cast<uint32_t>(millionths % kMillion);
     *out = '.';
-    std::memcpy(out + 1, kTriples[decimals / 1000].padded, 3);
-    std::memcpy(out + 4, kTriples[decimals % 1000].padded, 3);
+    std::memcpy(out + 1, kTriples[decimals / 1000].padded, 4);
+    std::memcpy(out + 4, kTriples[decimals % 1000].padded, 4);
     return out + 7;
 }
 

@@ -30,10 +30,8 @@ int32_t ParseInt(std::string_view text);
 /// The result of sscanf with "%d"; false, and value left alone, where no digits stand.
 bool ScanInt(std::string_view text, int32_t& value);
 
-/// A number in a row of text, read from where it starts. For inner loops: `text` begins at a token's first
-/// character and `end` is the token's end or any later separator; `next` receives the first character that is
-/// no part of the number. Narrowed from 64 bits.
-float ReadFloat(const char* text, const char* end, const char*& next, ENumber& kind);
+/// ReadFloat for numbers of any form.
+float ReadOddFloat(const char* text, const char* end, const char*& next, ENumber& kind);
 
 /// The most bytes that AppendFixed6 writes: sign, 39 digits, point, 6 digits.
 inline constexpr size_t kFixed6Bytes = 48;

@@ -4,6 +4,7 @@
 #include "CNode.h"
 #include "COrrinStream.h"
 #include "Numbers.h"
+#include "ReadFloat.h"
 
 #include <benchmark/benchmark.h>
 #include <charconv>

@@ -1,14 +1,18 @@
 #!/usr/bin/env python3
 """Measures whole processes in turns, so that a noisy machine slows both sides alike, and prints ratios of CPU time.
 
-    bench/whole_process.py BIN_FOLDER [--what convert|info|choose] [--mb 0.1 1.5 100] [--runs N] [--out FOLDER]
+    bench/whole_process.py BIN_FOLDER [--what LINE ...] [--mb 0.1 1.5 100] [--joints 75] [--frames N] [--runs N] [--out FOLDER]
 
-convert  a made motion of 75 joints by a profile given as a file whose rate is 120, so that every frame is written once
-info     what the motion holds
-choose   a conversion without --profile, which judges all installed ones, against one by the name of what it chooses
+one       a made motion of 75 joints, by a bone map given as a file. Its rate is 120: one row for each source frame
+four      by an installed map that is named. Its rate is 30, as in all installed ones: four rows for each source frame
+chosen    without --profile: the program chooses the same map among all installed ones
+faithful  as "one", with --align --faithful
+info      prints what the motion holds
+choice    "chosen" against "four": what choosing costs
 
-Against the first two another library only loads the same file. Prints the median of each, the median of the ratios of
-neighbours, and the peak memory, also as a multiple of the file. Results go to the folder, or to the temporary one.
+The other side only loads the same file with another library, except for "choice". Prints the median of each side, the
+median of the ratios of neighbors, and the peak memory, also as a multiple of the file. Results go to the folder, by
+default a temporary one.
 """
 import argparse
 import os
@@ -17,9 +21,10 @@ import subprocess
 import sys
 import tempfile
 
-from made_motion import write_motion, write_profile
+from made_motion import USUAL_JOINTS, write_motion, write_profile
 
-CHOSEN = "MotionBuilder / HumanIK (2 spine joints, fingers)"
+INSTALLED = "MotionBuilder / HumanIK (2 spine joints, fingers)"  # the one that is chosen for the made motion
+LINES = ["one", "four", "chosen", "faithful", "info", "choice"]
 LEAST_RUNS_BYTES = 10e6  # a smaller file takes so little time that it is run ten times as often
 
 
@@ -49,29 +54,41 @@ def compare(name, path, ours, others, runs):
           (name, statistics.median(a), statistics.median(b), ratio, peak / 1e6, peak / os.path.getsize(path)), flush=True)
 
 
-def measure(folder, options):
+def commands(folder, options):
+    """Both sides of every line."""
     tool, motion, profile = os.path.join(options.bin, "gaitwright"), folder + "/motion.bvh", folder + "/bench.prf"
-    choose = [tool, "convert", motion, "-o", (options.out or folder) + "/bench.Kinetra", "--force", "--quiet"]
-    load = [os.path.join(options.bin, "load_baseline"), motion]
-    commands = {"convert": (choose + ["--profile", profile], load), "info": ([tool, "info", motion], load),
-                "choose": (choose, choose + ["--profile", CHOSEN])}
     write_profile(profile)
+    load = [os.path.join(options.bin, "load_baseline"), motion]
+    chosen = [tool, "convert", motion, "-o", (options.out or folder) + "/bench.Kinetra", "--force", "--quiet"]
+    one, four = chosen + ["--profile", profile], chosen + ["--profile", INSTALLED]
+    return {"one": (one, load), "four": (four, load), "chosen": (chosen, load),
+            "faithful": (one + ["--align", "--faithful"], load), "info": ([tool, "info", motion], load),
+            "choice": (chosen, four)}
+
+
+def measure(folder, options):
+    sides = commands(folder, options)
     print("%-16s %11s %11s %7s %12s %8s" % ("", "gaitwright", "other", "ratio", "peak", "/ file"))
     for megabytes in options.mb:
-        write_motion(motion, megabytes)
+        motion = folder + "/motion.bvh"
+        write_motion(motion, megabytes, options.frames, options.joints)
         for what in options.what:
-            compare("%s %g MB" % (what, megabytes), motion, *commands[what], options.runs)
+            compare("%s %.3g MB" % (what, os.path.getsize(motion) / 1e6), motion, *sides[what], options.runs)
 
 
 def main():
     parser = argparse.ArgumentParser(description=__doc__, formatter_class=argparse.RawDescriptionHelpFormatter)
     parser.add_argument("bin")
-    parser.add_argument("--what", nargs="*", default=["convert"], choices=["convert", "choose", "info"])
+    parser.add_argument("--what", nargs="*", default=LINES[:4], choices=LINES)
     parser.add_argument("--mb", type=float, nargs="*", default=[0.1, 1.5, 100])
+    parser.add_argument("--joints", type=int, default=USUAL_JOINTS)
+    parser.add_argument("--frames", type=int, default=0, help="in place of --mb")
     parser.add_argument("--runs", type=int, default=5)
     parser.add_argument("--out")
+    options = parser.parse_args()
+    options.mb = [0] if options.frames else options.mb
     with tempfile.TemporaryDirectory() as folder:
-        measure(folder, parser.parse_args())
+        measure(folder, options)
 
 
 if __name__ == "__main__":

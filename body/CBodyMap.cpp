@@ -68,9 +68,9 @@ bool CBodyMap::HasFeet() const
     return std::ranges::all_of(legs, [](const BodyLeg& leg) { return leg.foot != nullptr; });
 }
 
-CBodyMap BodyOfTable(const CRetargeter& table, CNode& targetRoot)
+CBodyMap BodyOfTable(const CRetargeter& table, const CNodeNames& targets)
 {
-    const auto source = [&](const char* target) { return table.SourceOf(FindNode(&targetRoot, target)); };
+    const auto source = [&](const char* target) { return table.SourceOf(targets.Find(target)); };
     CBodyMap body;
     body.hip = source("LowerTorso");
     body.head = source("Head");

@@ -8,6 +8,7 @@
 namespace gw {
 
 class CNode;
+class CNodeNames;
 class CRetargeter;
 
 /// The side of the body, by its own right and left.
@@ -62,6 +63,6 @@ struct CBodyMap
 /// with the joints between hip, neck and head as the source's tree has them. A toe is the only child joint of
 /// a foot where no row names it. A torso bone that is driven from outside the spine (a collar) names no
 /// joint.
-CBodyMap BodyOfTable(const CRetargeter& table, CNode& targetRoot);
+CBodyMap BodyOfTable(const CRetargeter& table, const CNodeNames& targets);
 
 } // namespace gw

@@ -8,8 +8,9 @@
 #include "Numbers.h"
 #include "Text.h"
 
+#include <array>
+#include <optional>
 #include <string>
-#include <vector>
 
 namespace gw {
 
@@ -175,7 +176,7 @@ std::optional<uint32_t> Features(std::string_view token)
         size_t words;
         uint32_t features;
     };
-    std::vector<std::optional<Part>> parts(token.size() + 1); // of the first so many letters
+    std::array<std::optional<Part>, kLongestToken + 1> parts; // of the first so many letters
     parts[0] = Part{0, kNothing};
     for (size_t begin = 0; begin < token.size(); ++begin)
     {
@@ -183,7 +184,9 @@ std::optional<uint32_t> Features(std::string_view token)
             continue;
         for (const Word& word : kLexicon)
         {
-            if (!token.substr(begin).starts_with(word.text))
+            // Nearly all words differ in the first letter, and this is the inner loop of every search by
+            // names.
+            if (word.text.front() != token[begin] || !token.substr(begin).starts_with(word.text))
                 continue;
             std::optional<Part>& part = parts[begin + word.text.size()];
             const Part longer{parts[begin]->words + 1, parts[begin]->features | word.features};
@@ -191,7 +194,8 @@ std::optional<uint32_t> Features(std::string_view token)
                 part = longer;
         }
     }
-    return parts.back() ? std::optional(parts.back()->features) : std::nullopt;
+    const std::optional<Part>& whole = parts[token.size()];
+    return whole ? std::optional(whole->features) : std::nullopt;
 }
 
 uint32_t SideLetter(char letter)

@@ -4,15 +4,14 @@
 #include "Text.h"
 
 #include <algorithm>
-#include <map>
 #include <vector>
 
 namespace gw {
 
 namespace {
 
-// Every start of every name is tried on every name, so both are bounded: a body's joints stand among the
-// first, and no prefix is longer than a short title.
+// Starts are tried on every name, so both are bounded: a body's joints are among the first, and no prefix is
+// longer than a short title.
 constexpr size_t kNamesLooked = 256;
 constexpr size_t kLongestPrefix = 32;
 // A prefix is a habit of the skeleton: so many joints at least have it, and a third of those looked at.
@@ -23,30 +22,67 @@ bool IsWordCharacter(char c)
     return (c >= 'a' && c <= 'z') || (c >= '0' && c <= '9') || (c & 0x80) != 0;
 }
 
-size_t CountUnderstood(std::span<const std::string_view> names, std::string_view prefix)
+bool IsUnderstood(std::string_view name)
 {
-    return static_cast<size_t>(std::ranges::count_if(names, [=](std::string_view name) {
-        return ReadJointName(WithoutPrefix(name, prefix)).word != EJointWord::None;
-    }));
+    return ReadJointName(name).word != EJointWord::None;
 }
 
+// The starts that enough names share, in order. Sorted, the names that share one are neighbors, so that it is
+// enough to look at the ends of a window. A name that is nothing but the start does not count.
 std::vector<std::string> SharedStarts(std::span<const std::string_view> names)
 {
-    std::map<std::string, size_t> counts;
+    std::vector<std::string> sorted;
+    sorted.reserve(names.size());
     for (const std::string_view name : names)
-    {
-        const std::string lower = LowerCase(name);
-        for (size_t length = 1; length < std::min(lower.size(), kLongestPrefix + 1); ++length)
-            ++counts[lower.substr(0, length)];
-    }
+        sorted.push_back(LowerCase(name));
+    std::ranges::sort(sorted);
+    const size_t window = std::max(kLeastNames, names.size() / 3);
     std::vector<std::string> starts;
-    for (const auto& [start, count] : counts)
+    for (size_t first = 0; first + window <= sorted.size(); ++first)
     {
-        if (count >= std::max(kLeastNames, names.size() / 3))
-            starts.push_back(start);
+        const std::string& name = sorted[first];
+        const std::string& last = sorted[first + window - 1];
+        for (size_t length = 1; length < std::min(name.size(), kLongestPrefix + 1); ++length)
+        {
+            const std::string_view start = std::string_view(name).substr(0, length);
+            if (!last.starts_with(start))
+                break;
+            const bool isKnown =
+                first > 0 && sorted[first - 1].size() > length && sorted[first - 1].starts_with(start);
+            if (!isKnown)
+                starts.emplace_back(start);
+        }
     }
     return starts;
 }
+
+// How many names are understood without a prefix, or 0 once it is clear that they are fewer than `least`.
+// Most prefixes are none, and the first few names show it.
+class CUnderstoodNames
+{
+public:
+    explicit CUnderstoodNames(std::span<const std::string_view> names) : m_kNames(names)
+    {
+        for (const std::string_view name : names)
+            m_kWhole.push_back(IsUnderstood(name));
+    }
+
+    size_t CountWhole() const { return static_cast<size_t>(std::ranges::count(m_kWhole, true)); }
+    size_t CountWithout(std::string_view prefix, size_t least) const
+    {
+        size_t count = m_kNames.size();
+        for (size_t i = 0; i < m_kNames.size() && count >= least; ++i)
+        {
+            const std::string_view rest = WithoutPrefix(m_kNames[i], prefix);
+            count -= (rest.size() == m_kNames[i].size() ? m_kWhole[i] : IsUnderstood(rest)) ? 0 : 1;
+        }
+        return count >= least ? count : 0;
+    }
+
+private:
+    std::span<const std::string_view> m_kNames;
+    std::vector<bool> m_kWhole;
+};
 
 } // namespace
 
@@ -59,16 +95,18 @@ std::string_view WithoutNamespace(std::string_view name)
 std::string FindNamePrefix(std::span<const std::string_view> names)
 {
     names = names.first(std::min(names.size(), kNamesLooked));
+    const CUnderstoodNames understood(names);
     std::string best;
-    size_t most = CountUnderstood(names, best);
+    size_t most = understood.CountWhole();
     for (std::string& start : SharedStarts(names))
     {
-        const size_t understood = CountUnderstood(names, start);
         // What separates a prefix from the name belongs to the prefix.
         const bool closes = !best.empty() && start.starts_with(best) && !IsWordCharacter(start.back());
-        if (understood < most || (understood == most && !closes))
+        const size_t least = closes ? most : most + 1;
+        const size_t count = understood.CountWithout(start, least);
+        if (count < std::max<size_t>(least, 1))
             continue;
-        most = understood;
+        most = count;
         best = std::move(start);
     }
     return best;

@@ -4,6 +4,7 @@
 #include "CTextLines.h"
 #include "NumberText.h"
 #include "Numbers.h"
+#include "ReadFloat.h"
 #include "RotationTurns.h"
 #include "TKBVHFile.h"
 #include "Text.h"

@@ -35,7 +35,7 @@ const CKeyframeControl* TrackOf(const CNode& node)
 double Travel(const CKeyframeControl& track)
 {
     double travel = 0.0;
-    for (const Vec3& position : track.m_kPositionKeys)
+    for (const Vec3& position : track.m_kPositionKeys.Distinct())
         travel = std::max(travel, Vec3Length(position - track.m_kPositionKeys[0]));
     return travel;
 }

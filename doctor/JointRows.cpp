@@ -19,14 +19,14 @@ bool IsRotation(int channel)
 
 Quat RotationIn(const OutlineJoint& joint, const CRowTable& table, size_t row)
 {
-    Mat3 rotation = kMat3Identity;
+    CAxisRotation rotation;
     for (size_t i = 0; i < joint.channels.size(); ++i)
     {
         if (IsRotation(joint.channels[i]))
-            RotateRows(rotation, static_cast<size_t>(joint.channels[i] - kFirstRotation),
-                       table.At(row, joint.firstColumn + i) * kDegreesToRadians);
+            rotation.RotateRows(static_cast<size_t>(joint.channels[i] - kFirstRotation),
+                                table.At(row, joint.firstColumn + i) * kDegreesToRadians);
     }
-    return QuatFromMat3(rotation);
+    return QuatFromMat3(rotation.Matrix());
 }
 
 } // namespace

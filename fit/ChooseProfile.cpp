@@ -2,12 +2,16 @@
 
 #include "CRetargeter.h"
 #include "FindBone.h"
+#include "ProfileFile.h"
 #include "SharedPrefix.h"
+#include "Skeleton.h"
 #include "Text.h"
 
 #include <algorithm>
 #include <array>
+#include <deque>
 #include <functional>
+#include <iterator>
 #include <map>
 #include <optional>
 #include <set>
@@ -22,12 +26,13 @@ class CSkeletons
 {
 public:
     CSkeletons(CNode& source, CNode& target)
-        : m_kSource(source), m_kTarget(target), m_kSourceNames(&source), m_kTargetNames(&target)
+        : m_kSource(source), m_kTargetNodes(target), m_kSourceNames(&source), m_kTargetNames(&target)
     {
     }
 
     void Match(ProfileChoice& choice) const;
     void Judge(ProfileChoice& choice);
+    const CBoneNames& Sources() const { return m_kSourceNames; }
     const std::vector<std::string>& SourceNames() const { return m_kSourceNames.Names(); }
 
 private:
@@ -40,7 +45,7 @@ private:
     }
 
     CNode& m_kSource;
-    CNode& m_kTarget;
+    CNodeNames m_kTargetNodes;
     CBoneNames m_kSourceNames;
     CBoneNames m_kTargetNames;
     std::optional<SourceBody> m_kBody;
@@ -56,7 +61,7 @@ void CSkeletons::Judge(ProfileChoice& choice)
 {
     CRetargeter table;
     ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
-    choice.verdict = JudgeProfile(table, m_kTarget, Body());
+    choice.verdict = JudgeProfile(table, m_kTargetNodes, Body());
 }
 
 // Larger is better. A profile of which rows do not fit is ranked by the share of those that do.
@@ -133,25 +138,58 @@ void JudgeWhole(std::vector<ProfileChoice>& choices, CSkeletons& skeletons, EJud
     }
 }
 
+bool AnyFits(const std::vector<ProfileChoice>& choices)
+{
+    return std::ranges::any_of(choices, [](const ProfileChoice& choice) { return choice.match.IsWhole(); });
+}
+
+std::vector<ProfileChoice> ReadAll(std::span<const LoadedProfile> profiles, const CSkeletons& skeletons)
+{
+    std::vector<ProfileChoice> choices;
+    choices.reserve(profiles.size()); // growing would copy all rows
+    for (const LoadedProfile& profile : profiles)
+    {
+        choices.push_back({profile.path, RowsOfText(profile.text), false, {}, {}});
+        skeletons.Match(choices.back());
+    }
+    return choices;
+}
+
+// Those that can be whole.
+std::vector<ProfileChoice> ReadPromising(std::span<const LoadedProfile> profiles, const CSkeletons& skeletons)
+{
+    std::vector<LoadedProfile> promising;
+    std::ranges::copy_if(profiles, std::back_inserter(promising), [&](const LoadedProfile& profile) {
+        return MayFit(profile.text, skeletons.Sources());
+    });
+    return ReadAll(promising, skeletons);
+}
+
 } // namespace
 
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
                                          CNode& targetRoot, EJudged judged)
 {
-    CSkeletons skeletons(sourceRoot, targetRoot);
-    std::vector<ProfileChoice> choices;
-    choices.reserve(paths.size()); // growing would copy all rows
+    std::deque<std::string> texts;
+    std::vector<LoadedProfile> profiles;
     for (const std::string& path : paths)
     {
-        ProfileChoice choice;
-        choice.path = path;
-        if (!ReadProfileRows(path, choice.profile))
-            continue;
-        skeletons.Match(choice);
-        choices.push_back(std::move(choice));
+        if (std::string text; ReadProfileText(path, text))
+            profiles.push_back({path, texts.emplace_back(std::move(text))});
     }
-    const auto fits = [](const ProfileChoice& choice) { return choice.match.IsWhole(); };
-    if (std::ranges::none_of(choices, fits))
+    return ChooseProfile(profiles, sourceRoot, targetRoot, judged);
+}
+
+std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, CNode& sourceRoot,
+                                         CNode& targetRoot, EJudged judged)
+{
+    CSkeletons skeletons(sourceRoot, targetRoot);
+    std::vector<ProfileChoice> choices;
+    if (judged == EJudged::First)
+        choices = ReadPromising(profiles, skeletons);
+    if (!AnyFits(choices))
+        choices = ReadAll(profiles, skeletons);
+    if (!AnyFits(choices))
         std::ranges::move(AdaptToPrefix(choices, skeletons), std::back_inserter(choices));
     JudgeWhole(choices, skeletons, judged);
     std::ranges::stable_sort(choices, std::greater(), Rank);

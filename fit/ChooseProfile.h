@@ -6,6 +6,7 @@
 #include <cstdint>
 #include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace gw {
@@ -20,11 +21,18 @@ struct ProfileChoice
     ProfileVerdict verdict; ///< of a profile whose rows all fit
 };
 
+/// A profile's file with its text, which has been read already.
+struct LoadedProfile
+{
+    std::string path;
+    std::string_view text; ///< must outlive the choice
+};
+
 /// Which of the profiles that fit get a verdict.
 enum class EJudged : uint8_t
 {
     All,
-    First, ///< those that may stand first; the others stand behind them in no order that means anything
+    First, ///< those that may be first; the others are behind them in no particular order, or left out
 };
 
 /// Holds profiles against a source, the best one first. Those of which all rows fit go before the others, and
@@ -33,6 +41,8 @@ enum class EJudged : uint8_t
 /// given. Where no profile fits as it is and the source's joints share a prefix, profiles that fit with that
 /// prefix, or without their own one, come first as adapted ones. Files that cannot be read are left out.
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
+                                         CNode& targetRoot, EJudged judged = EJudged::All);
+std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, CNode& sourceRoot,
                                          CNode& targetRoot, EJudged judged = EJudged::All);
 
 } // namespace gw

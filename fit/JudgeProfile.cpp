@@ -76,9 +76,10 @@ void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdic
         verdict.doubts.push_back({EProfileDoubt::SpineCut, {}, NameOf(chest), NameOf(body.spine.back())});
 }
 
-void CheckTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body, ProfileVerdict& verdict)
+void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
+                ProfileVerdict& verdict)
 {
-    const std::vector<RowTurn> turns = MeasureTurns(table, targetRoot, body);
+    const std::vector<RowTurn> turns = MeasureTurns(table, targets, body);
     for (const RowTurn& turn : turns)
     {
         verdict.turn += turn.degrees / static_cast<double>(turns.size());
@@ -102,16 +103,16 @@ ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
 
 SourceBody::SourceBody(CNode& root) : byNames(FindBodyByNames(root)), tree(root) {}
 
-ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const SourceBody& source)
+ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, const SourceBody& source)
 {
-    CBodyMap body = BodyOfTable(table, targetRoot);
+    CBodyMap body = BodyOfTable(table, targets);
     AddUntold(source.byNames, body);
     ProfileVerdict verdict;
     for (const BodyDoubt& doubt : CheckBody(body, source.tree))
         verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
-    CheckSpine(body, table.SourceOf(FindNode(&targetRoot, "UpperTorso")), verdict);
-    CheckTurns(table, targetRoot, body, verdict);
+    CheckSpine(body, table.SourceOf(targets.Find("UpperTorso")), verdict);
+    CheckTurns(table, targets, body, verdict);
     verdict.sureness = SurenessOf(verdict.doubts);
     return verdict;
 }

@@ -11,7 +11,7 @@
 
 namespace gw {
 
-class CNode;
+class CNodeNames;
 class CRetargeter;
 
 /// How sure it is that a profile's rows name the joints that they should.
@@ -64,6 +64,6 @@ struct SourceBody
 };
 
 /// Judges the rows that a retargeter was told.
-ProfileVerdict JudgeProfile(const CRetargeter& table, CNode& targetRoot, const SourceBody& source);
+ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, const SourceBody& source);
 
 } // namespace gw

@@ -8,6 +8,7 @@
 #include "SharedPrefix.h"
 #include "Text.h"
 
+#include <algorithm>
 #include <vector>
 
 namespace gw {
@@ -38,12 +39,37 @@ bool ReadProfileRows(const std::string& path, ProfileRows& profile)
     std::string text;
     if (!ReadProfileText(path, text))
         return false;
+    profile = RowsOfText(text);
+    return true;
+}
+
+ProfileRows RowsOfText(std::string_view text)
+{
     CProfileReader reader(text);
-    profile = {};
+    ProfileRows profile;
     profile.name = reader.Name();
     for (CProfileLine line; reader.Next(line);)
         TakeLine(line, profile);
     profile.rows.AddPelvisRows();
+    return profile;
+}
+
+bool MayFit(std::string_view text, const CBoneNames& sources)
+{
+    CProfileReader reader(text);
+    std::vector<std::string> targets; // a second row of one target does not change its source
+    const auto isKnown = [&](const std::string& target) {
+        return std::ranges::any_of(targets,
+                                   [&](const std::string& known) { return EqualNoCase(known, target); });
+    };
+    for (CProfileLine line; reader.Next(line);)
+    {
+        if (line.kind != EProfileLine::Mapping && line.kind != EProfileLine::Fixed)
+            continue;
+        if (!EqualNoCase(line.source, kFixedSource) && !sources.Find(line.source))
+            return isKnown(line.target);
+        targets.push_back(std::move(line.target));
+    }
     return true;
 }
 

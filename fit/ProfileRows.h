@@ -22,6 +22,12 @@ struct ProfileRows
 
 /// Reads a profile. False, and the record left alone, when the file cannot be read.
 bool ReadProfileRows(const std::string& path, ProfileRows& profile);
+/// Reads the text of a profile.
+ProfileRows RowsOfText(std::string_view text);
+/// False if a profile names a source bone that does not exist, so that not all of its rows can fit. Most
+/// profiles name one in their first rows and are read no further. In rare cases true for such a profile as
+/// well.
+bool MayFit(std::string_view text, const CBoneNames& sources);
 /// The bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 

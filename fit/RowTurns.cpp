@@ -62,17 +62,17 @@ void LeadToFingers(Lead& hand)
         hand.next = {hand.source};
 }
 
-std::vector<Lead> FindLeads(const CRetargeter& table, CNode& targetRoot)
+std::vector<Lead> FindLeads(const CRetargeter& table, const CNodeNames& targets)
 {
     std::vector<Lead> leads;
     for (const LeadRow& row : kLeads)
     {
-        CNode* const target = FindNode(&targetRoot, row.bone);
+        CNode* const target = targets.Find(row.bone);
         CNode* const source = table.SourceOf(target);
         if (!source)
             continue;
         leads.push_back({target, source, source, {}});
-        if (CNode* const next = row.next ? table.SourceOf(FindNode(&targetRoot, row.next)) : nullptr)
+        if (CNode* const next = row.next ? table.SourceOf(targets.Find(row.next)) : nullptr)
             leads.back().next = {next};
         if (row.isHand)
             LeadToFingers(leads.back());
@@ -130,12 +130,12 @@ bool HasLimbs(const CBodyMap& body)
 
 } // namespace
 
-std::vector<RowTurn> MeasureTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body)
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body)
 {
     if (!HasLimbs(body))
         return {};
     CBodyPoses poses(body);
-    const std::vector<Lead> leads = FindLeads(table, targetRoot);
+    const std::vector<Lead> leads = FindLeads(table, targets);
     std::vector<RowTurn> turns;
     for (const Lead& lead : leads)
     {

@@ -6,6 +6,7 @@
 
 namespace gw {
 
+class CNodeNames;
 class CRetargeter;
 
 /// How far a row leaves its target bone from where the source's limb has it, about all axes.
@@ -20,6 +21,6 @@ struct RowTurn
 /// stands across. Looked at is the source's rest pose where a body stands in it, else some frames of its
 /// motion. Thighs and calves are not told, since planting turns them anyway; nothing is, where the body has
 /// not both arms and legs. The source's nodes are as they were when this returns.
-std::vector<RowTurn> MeasureTurns(const CRetargeter& table, CNode& targetRoot, const CBodyMap& body);
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body);
 
 } // namespace gw

@@ -118,6 +118,23 @@ double QuotientAngle(float numerator, float denominator)
     return std::atan(static_cast<double>(numerator) / denominator);
 }
 
+// An arc sine has no negative cosine, so its cosine cannot change a sign; it is not computed. A NaN has none.
+double InHalfTurn(double angle, float denominator, double y)
+{
+    return denominator < 0.0f && !std::isnan(y) ? angle + kPi64 : angle;
+}
+
+// The five elements that the "ZYX" decomposition looks at: the first row, and the ends of the others.
+Vec3 EulerDegreesOf(const Vec3& row0, float m5, float m8)
+{
+    const double y = SafeAsin(-row0.z);
+    const double x = InHalfTurn(QuotientAngle(m5, m8), m8, y);
+    const double z = InHalfTurn(QuotientAngle(row0.y, row0.x), row0.x, y);
+    const double degrees = kInversePi64 * 180.0;
+    return {static_cast<float>(x * degrees), static_cast<float>(y * degrees),
+            static_cast<float>(z * degrees)};
+}
+
 } // namespace
 
 Mat3 EulerToMat3(std::string_view order, const Vec3& degrees)
@@ -152,18 +169,13 @@ void Mat3ToEuler(const Mat3& m, int order, float& x, float& y, float& z)
 
 Vec3 Mat3ToEulerDegrees(const Mat3& matrix)
 {
-    const float* m = matrix.m;
-    const double y = SafeAsin(-m[2]);
-    const double cosY = std::cos(y);
-    double x = QuotientAngle(m[5], m[8]);
-    if (cosY * m[8] < 0.0)
-        x += kPi64;
-    double z = QuotientAngle(m[1], m[0]);
-    if (cosY * m[0] < 0.0)
-        z += kPi64;
-    const double degrees = kInversePi64 * 180.0;
-    return {static_cast<float>(x * degrees), static_cast<float>(y * degrees),
-            static_cast<float>(z * degrees)};
+    return EulerDegreesOf(matrix.Row(0), matrix.m[5], matrix.m[8]);
+}
+
+Vec3 RowsToEulerDegrees(const Mat4& m, double rowLength0)
+{
+    const auto lastOf = [&m](int row) { return Vec3Normalized(m.Row(row)).z; };
+    return EulerDegreesOf(Vec3DividedBy(m.Row(0), rowLength0), lastOf(1), lastOf(2));
 }
 
 void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z)

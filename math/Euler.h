@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Mat3.h"
+#include "Mat4.h"
 
 #include <string_view>
 
@@ -30,6 +30,9 @@ void Mat3ToEuler(const Mat3& m, int order, float& x, float& y, float& z);
 /// quotient of 0 by 0 counts as 0.
 void Mat3ToEulerDegrees(const Mat3& m, float& x, float& y, float& z);
 Vec3 Mat3ToEulerDegrees(const Mat3& m);
+/// The same for the normalized rows of a transform, bit for bit, with only as many divisions as that takes.
+/// The caller knows the length of row 0.
+Vec3 RowsToEulerDegrees(const Mat4& m, double rowLength0);
 
 /// The angles in degrees about X, Y and Z, -180 to 180, that give a "ZYX" matrix back in every case: near a
 /// quarter turn about Y, where those of X and Z run into each other, one takes up what the other is off.

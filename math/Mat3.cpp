@@ -4,18 +4,6 @@
 
 namespace gw {
 
-Mat3 operator*(const Mat3& a, const Mat3& b)
-{
-    Mat3 out;
-    for (int row = 0; row < 3; ++row)
-    {
-        const float* r = a.m + 3 * static_cast<ptrdiff_t>(row);
-        for (int column = 0; column < 3; ++column)
-            out.m[3 * row + column] = r[0] * b.m[column] + r[1] * b.m[3 + column] + r[2] * b.m[6 + column];
-    }
-    return out;
-}
-
 Mat3& Mat3Multiply(const Mat3& a, const Mat3& b, Mat3& out)
 {
     out = a * b;
@@ -42,13 +30,6 @@ Mat3 Mat3FromAxisAngle(const Vec3& axis, float angle)
 void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle)
 {
     out = Mat3FromAxisAngle(axis, angle);
-}
-
-Mat3 Mat3Transpose(const Mat3& a)
-{
-    return {
-        {a.m[0], a.m[3], a.m[6], a.m[1], a.m[4], a.m[7], a.m[2], a.m[5], a.m[8]}
-    };
 }
 
 Mat3 Mat3InverseOrIdentity(const Mat3& a)

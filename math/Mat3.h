@@ -32,13 +32,32 @@ inline constexpr Mat3 kMat3Identity{
     {1, 0, 0, 0, 1, 0, 0, 0, 1}
 };
 
-/// out := a · b; out may be a or b. Answers out.
+/// The product: a acts first.
+inline Mat3 operator*(const Mat3& a, const Mat3& b)
+{
+    Mat3 out;
+    for (int row = 0; row < 3; ++row)
+    {
+        const float* r = a.m + 3 * static_cast<ptrdiff_t>(row);
+        for (int column = 0; column < 3; ++column)
+            out.m[3 * row + column] = r[0] * b.m[column] + r[1] * b.m[3 + column] + r[2] * b.m[6 + column];
+    }
+    return out;
+}
+
+/// The transpose, which is the inverse of a rotation.
+inline Mat3 Mat3Transpose(const Mat3& a)
+{
+    return {
+        {a.m[0], a.m[3], a.m[6], a.m[1], a.m[4], a.m[7], a.m[2], a.m[5], a.m[8]}
+    };
+}
+
+/// out := a · b; out may be a or b. Returns out.
 Mat3& Mat3Multiply(const Mat3& a, const Mat3& b, Mat3& out);
-Mat3 operator*(const Mat3& a, const Mat3& b);
 /// The rotation about an axis of unit length (not normalised here) by an angle in radians, into out.
 void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle);
 Mat3 Mat3FromAxisAngle(const Vec3& axis, float angle);
-Mat3 Mat3Transpose(const Mat3& a);
 /// The general inverse; the identity where there is none.
 Mat3 Mat3InverseOrIdentity(const Mat3& a);
 

@@ -1,7 +1,5 @@
 #include "Mat4.h"
 
-#include "Angles.h"
-
 #include <cmath>
 
 namespace gw {
@@ -10,29 +8,6 @@ void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const
 {
     out = Mat4Compose(rotation ? *rotation : kMat3Identity, translation ? *translation : kVec3Zero,
                       scale ? *scale : kVec3One);
-}
-
-Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scale)
-{
-    const float* r = rotation.m;
-    return {
-        {r[0] * scale.x, r[1] * scale.x, r[2] * scale.x, 0.0f, r[3] * scale.y, r[4] * scale.y, r[5] * scale.y,
-         0.0f, r[6] * scale.z, r[7] * scale.z, r[8] * scale.z, 0.0f, translation.x, translation.y,
-         translation.z, 1.0f}
-    };
-}
-
-Mat4 operator*(const Mat4& a, const Mat4& b)
-{
-    Mat4 out;
-    for (int row = 0; row < 4; ++row)
-    {
-        const float* r = a.m + 4 * static_cast<ptrdiff_t>(row);
-        for (int column = 0; column < 4; ++column)
-            out.m[4 * row + column] = r[0] * b.m[column] + r[1] * b.m[4 + column] + r[2] * b.m[8 + column] +
-                                      r[3] * b.m[12 + column];
-    }
-    return out;
 }
 
 Mat4* Mat4Multiply(Mat4* out, const Mat4* a, const Mat4* b)
@@ -95,36 +70,11 @@ Mat4 Mat4InverseOrIdentity(const Mat4& m)
     return out;
 }
 
-Vec3 TransformCoord(const Vec3& v, const Mat4& matrix)
-{
-    const float* m = matrix.m;
-    const Vec3 p{v.x * m[0] + v.y * m[4] + v.z * m[8] + m[12], v.x * m[1] + v.y * m[5] + v.z * m[9] + m[13],
-                 v.x * m[2] + v.y * m[6] + v.z * m[10] + m[14]};
-    const float w = v.x * m[3] + v.y * m[7] + v.z * m[11] + m[15];
-    if (std::fabs(w - 1.0f) <= kEpsilon)
-        return p;
-    return p * (1.0f / w);
-}
-
 Vec3* TransformCoord(Vec3* out, const Vec3* v, const Mat4* m)
 {
     if (!out || !v || !m)
         return nullptr;
     *out = TransformCoord(*v, *m);
-    return out;
-}
-
-Vec3 RowLengths(const Mat4& m)
-{
-    return {static_cast<float>(Vec3Length(m.Row(0))), static_cast<float>(Vec3Length(m.Row(1))),
-            static_cast<float>(Vec3Length(m.Row(2)))};
-}
-
-Mat3 NormalizedRows(const Mat4& m)
-{
-    Mat3 out;
-    for (int row = 0; row < 3; ++row)
-        out.SetRow(row, Vec3Normalized(m.Row(row)));
     return out;
 }
 

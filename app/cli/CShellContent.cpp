@@ -14,7 +14,7 @@
 #include "Words.h"
 
 #include <algorithm>
-#include <initializer_list>
+#include <array>
 #include <unordered_set>
 #include <utility>
 
@@ -41,23 +41,6 @@ CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfil
     return ShellFailure({}, "not-installed",
                         "no profile " + Quoted(name) + " is installed" + guess +
                             " ('gaitwright profiles' lists them)");
-}
-
-// Reads each folder once: asking for the path of every name would read all files for each.
-std::vector<CInstalledProfile> ReadInstalled(std::initializer_list<std::pair<std::string, bool>> folders)
-{
-    std::vector<CInstalledProfile> profiles;
-    std::unordered_set<std::string> names;
-    for (const auto& [folder, stock] : folders)
-    {
-        for (const std::string& file : FilesInFolder(folder, ".prf"))
-        {
-            std::string name = ReadProfileName(folder + file);
-            if (names.insert(LowerCase(name)).second)
-                profiles.push_back({std::move(name), folder + file, stock});
-        }
-    }
-    return profiles;
 }
 
 // The line of a profile that gives it its frame rate or position, quoted; the last one counts.
@@ -110,11 +93,25 @@ std::string CShellContent::FindProfilePath(const std::string& name)
 const std::vector<CInstalledProfile>& CShellContent::InstalledProfiles()
 {
     if (!m_kInstalled)
-        m_kInstalled = ReadInstalled({
-            {ExeFile({}),     true },
-            {ProfileFile({}), false}
-        });
+    {
+        m_kInstalled.emplace();
+        ReadInstalled(ExeFile({}), true);
+        ReadInstalled(ProfileFile({}), false);
+    }
     return *m_kInstalled;
+}
+
+// Each name once, with the first profile of that name.
+void CShellContent::ReadInstalled(const std::string& folder, bool stock)
+{
+    std::unordered_set<std::string> names;
+    for (const CInstalledProfile& profile : *m_kInstalled)
+        names.insert(LowerCase(profile.name));
+    for (const CProfileTexts::Entry& entry : m_kTexts.emplace_back(folder).Entries())
+    {
+        if (names.insert(LowerCase(entry.name)).second)
+            m_kInstalled->push_back({entry.name, folder + entry.file, stock, entry.text});
+    }
 }
 
 void CShellContent::SelectProfileByName(const std::string& name)
@@ -169,25 +166,30 @@ bool CShellContent::SelectProfile(const std::string& nameOrFile)
     return true;
 }
 
-std::vector<ProfileChoice> CShellContent::HoldAgainstSource(std::span<const std::string> paths,
-                                                            EJudged judged) const
+template <class T>
+std::vector<ProfileChoice> CShellContent::HoldAgainstSource(std::span<const T> profiles, EJudged judged) const
 {
     CNode* const source = SourceRoot();
     CNode* const target = ResultMotion().motionRoot.Get();
-    return source && target ? gw::ChooseProfile(paths, *source, *target, judged)
+    return source && target ? gw::ChooseProfile(profiles, *source, *target, judged)
                             : std::vector<ProfileChoice>();
 }
 
 std::vector<ProfileChoice> CShellContent::Choices(EJudged judged)
 {
-    std::vector<std::string> paths;
+    std::vector<LoadedProfile> profiles;
     for (const CInstalledProfile& profile : InstalledProfiles())
-        paths.push_back(profile.path);
+    {
+        if (profile.text)
+            profiles.push_back({profile.path, *profile.text});
+    }
     // Where nothing fits at all, what is told of is a profile that animators know.
-    std::ranges::stable_sort(paths, {}, [&](const std::string& path) {
-        return std::ranges::find_if(kLongKnown, [&](const char* file) { return path == ExeFile(file); });
-    });
-    std::vector<ProfileChoice> choices = HoldAgainstSource(paths, judged);
+    const auto rank =
+        [known = std::array{ExeFile(kLongKnown[0]), ExeFile(kLongKnown[1])}](const LoadedProfile& profile) {
+            return std::ranges::find(known, profile.path) - known.begin();
+        };
+    std::ranges::stable_sort(profiles, {}, rank);
+    std::vector<ProfileChoice> choices = HoldAgainstSource<LoadedProfile>(profiles, judged);
     const auto pick = std::ranges::find(choices, ProfilePath(), &ProfileChoice::path);
     if (pick != choices.end())
         std::rotate(choices.begin(), pick, pick + 1);
@@ -212,7 +214,7 @@ bool CShellContent::SelectFittingProfile(const std::string& source, std::optiona
 bool CShellContent::KeepStockPick(const std::string& source)
 {
     const std::string path[] = {ProfilePath()};
-    for (ProfileChoice& choice : HoldAgainstSource(path, EJudged::All))
+    for (ProfileChoice& choice : HoldAgainstSource<std::string>(path, EJudged::All))
     {
         std::erase_if(choice.verdict.doubts,
                       [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });

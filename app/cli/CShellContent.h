@@ -2,12 +2,15 @@
 
 #include "CGaitConvertContent.h"
 #include "CPrivateProfile.h"
+#include "CProfileTexts.h"
 #include "ChooseProfile.h"
 
 #include <cstdint>
+#include <deque>
 #include <optional>
 #include <span>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace gw {
@@ -20,7 +23,8 @@ struct CInstalledProfile
 {
     std::string name;
     std::string path;
-    bool stock = false; ///< beside the program, and not one of the user's own
+    bool stock = false;                   ///< installed with the program, not one of the user's own
+    std::optional<std::string_view> text; ///< empty if it cannot be read; valid as long as the content
 };
 
 /// Whether opening a source selects a stock profile that fits it.
@@ -71,13 +75,16 @@ public:
     void PickStockProfile() override;
 
 private:
-    std::vector<ProfileChoice> HoldAgainstSource(std::span<const std::string> paths, EJudged judged) const;
+    template <class T>
+    std::vector<ProfileChoice> HoldAgainstSource(std::span<const T> profiles, EJudged judged) const;
+    void ReadInstalled(const std::string& folder, bool stock);
     bool KeepStockPick(const std::string& source);
     bool Take(const std::string& source, const ProfileChoice& choice);
     bool SelectAdapted(const ProfileChoice& choice);
 
     CContentWindow& m_kWindow;
     EStockPick m_eStockPick;
+    std::deque<CProfileTexts> m_kTexts;                         ///< of the folders of installed profiles
     std::optional<std::vector<CInstalledProfile>> m_kInstalled; ///< once asked for
     std::string m_kFileName; ///< display name of the profile in m_kFilePath
     std::string m_kFilePath; ///< of the profile that was named by its file, or empty

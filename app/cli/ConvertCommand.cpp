@@ -62,7 +62,7 @@ EExit RunOne(const COptions& options, const CConversionJob& job)
     std::optional<CPagePart> part;
     if (IsPageAsked(options))
         part.emplace(1, 1);
-    const EConversion outcome = ConvertFile(options, job, nullptr, part ? &*part : nullptr);
+    const EConversion outcome = ConvertFile(options, job, nullptr, part ? &*part : nullptr, EProcess::Ends);
     bool isWritten = true;
     if (part && part->HasFigures())
     {

@@ -30,12 +30,19 @@ enum class EConversion : uint8_t
 /// "converted", "failed", ...
 const char* OutcomeName(EConversion outcome);
 
+/// What the process does after a conversion.
+enum class EProcess : uint8_t
+{
+    GoesOn,
+    Ends, ///< its motions need not be freed
+};
+
 /// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Tells the result
 /// on standard output and everything else on standard error. Each has a state machine of its own, so that
 /// nothing of one source stays for the next. A record, unless it is null, takes what --json tells and
 /// the key figures, and a part of a page the conversion's pictures and figures.
 EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
-                        CPagePart* part);
+                        CPagePart* part, EProcess process = EProcess::GoesOn);
 
 /// Tells in the same way of a conversion that came to nothing, for a reason that it could not tell itself.
 void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record);

@@ -2,27 +2,55 @@
 
 #include "Mat3.h"
 
+#include <array>
 #include <cmath>
 #include <cstddef>
 
 namespace gw {
 
-/// m := R · m for the rotation R about one axis (0 X, 1 Y, 2 Z) by an angle in radians. Such a rotation
-/// changes two rows of m only, so that this takes a third of a matrix product; the result is that of
-/// Mat3FromAxisAngle and Mat3Multiply within rounding.
-inline void RotateRows(Mat3& m, size_t axis, float radians)
+/// A rotation that grows axis by axis, for the inner loops of the readers. Each step changes two rows only, a
+/// third of a matrix product; rows are padded to four floats, so that a step takes a handful of vector
+/// instructions.
+class CAxisRotation
 {
-    const float c = std::cos(radians);
-    const float s = std::sin(radians);
-    float* const a = &m.m[3 * ((axis + 1) % 3)];
-    float* const b = &m.m[3 * ((axis + 2) % 3)];
-    for (int column = 0; column < 3; ++column)
+public:
+    CAxisRotation() : CAxisRotation(kMat3Identity) {}
+    explicit CAxisRotation(const Mat3& m)
     {
-        const float x = a[column];
-        const float y = b[column];
-        a[column] = c * x + s * y;
-        b[column] = c * y - s * x;
+        for (size_t row = 0; row < 3; ++row)
+            m_kRows[row] = {m.m[3 * row], m.m[3 * row + 1], m.m[3 * row + 2], 0.0f};
     }
-}
+
+    /// M := R · M for the rotation R about one axis (0 X, 1 Y, 2 Z) by an angle in radians. The result is
+    /// that of Mat3FromAxisAngle and Mat3Multiply within rounding.
+    void RotateRows(size_t axis, float radians)
+    {
+        const float c = std::cos(radians);
+        const float s = std::sin(radians);
+        const Row a = m_kRows[kNextAxis[axis]];
+        const Row b = m_kRows[kNextAxis[axis + 1]];
+        Row& newA = m_kRows[kNextAxis[axis]];
+        for (size_t column = 0; column < a.size(); ++column)
+            newA[column] = c * a[column] + s * b[column];
+        Row& newB = m_kRows[kNextAxis[axis + 1]];
+        for (size_t column = 0; column < a.size(); ++column)
+            newB[column] = c * b[column] - s * a[column];
+    }
+
+    Mat3 Matrix() const
+    {
+        Mat3 m;
+        for (size_t row = 0; row < 3; ++row)
+            m.SetRow(static_cast<int>(row), {m_kRows[row][0], m_kRows[row][1], m_kRows[row][2]});
+        return m;
+    }
+
+private:
+    using Row = std::array<float, 4>;
+
+    static constexpr size_t kNextAxis[] = {1, 2, 0, 1};
+
+    alignas(16) std::array<Row, 3> m_kRows;
+};
 
 } // namespace gw

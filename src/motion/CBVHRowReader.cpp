@@ -9,6 +9,7 @@
 #include "AxisRotation.h"
 #include "CTextLines.h"
 #include "Numbers.h"
+#include "ReadFloat.h"
 #include "TKBVHFile.h"
 #include "Text.h"
 
@@ -41,7 +42,7 @@ const char* SkipSeparators(const char* text, const char* end)
 
 void AppendKey(TKBVHJoint& joint, const float* values)
 {
-    Mat3 rotation = kMat3Identity;
+    CAxisRotation rotation;
     Vec3 position = joint.offset;
     float* const components[] = {&position.x, &position.y, &position.z};
     for (const int channel : joint.channels)
@@ -50,9 +51,9 @@ void AppendKey(TKBVHJoint& joint, const float* values)
         if (channel < kFirstRotation)
             *components[channel] += value;
         else if (channel < kFirstScale)
-            RotateRows(rotation, static_cast<size_t>(channel - kFirstRotation), value * kDegreesToRadians);
+            rotation.RotateRows(static_cast<size_t>(channel - kFirstRotation), value * kDegreesToRadians);
     }
-    joint.rotationKeys.push_back(QuatFromMat3(rotation));
+    joint.rotationKeys.push_back(QuatFromMat3(rotation.Matrix()));
     joint.positionKeys.push_back(position);
 }
 

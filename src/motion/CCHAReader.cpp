@@ -3,6 +3,7 @@
 #include "CTextLines.h"
 #include "MotionNode.h"
 #include "Numbers.h"
+#include "ReadFloat.h"
 #include "Text.h"
 
 #include <algorithm>

@@ -118,7 +118,7 @@ void CFaithfulPose::WriteFrame(size_t frame, const std::vector<CKeyframeControl*
 {
     PoseFrame(frame, tracks);
     if (IsFinite(m_kPlan->Root(frame)))
-        tracks.front()->m_kPositionKeys[frame] = m_kPlan->Root(frame);
+        tracks.front()->m_kPositionKeys.Set(frame, m_kPlan->Root(frame));
     for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
         WriteLeg(leg, frame, tracks);
 }

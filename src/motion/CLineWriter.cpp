@@ -5,17 +5,6 @@
 
 namespace gw {
 
-namespace {
-
-constexpr std::string_view kLineEnd =
-#ifdef _WIN32
-    "\r\n";
-#else
-    "\n";
-#endif
-
-} // namespace
-
 bool CLineWriter::Flush()
 {
     if (m_uiUsed > 0 && !m_bRefused)
@@ -24,11 +13,9 @@ bool CLineWriter::Flush()
     return !m_bRefused;
 }
 
-// Where that many bytes can be written.
-char* CLineWriter::Room(size_t byteCount)
+char* CLineWriter::MakeRoom(size_t byteCount)
 {
-    if (m_kBuffer.size() - m_uiUsed < byteCount)
-        Flush();
+    Flush();
     if (m_kBuffer.size() < byteCount)
         m_kBuffer.resize(byteCount);
     return m_kBuffer.data() + m_uiUsed;
@@ -64,7 +51,7 @@ CLineWriter& CLineWriter::Shortest(float value)
 
 void CLineWriter::EndLine()
 {
-    Text(kLineEnd);
+    Text(kTextLineEnd);
 }
 
 void CLineWriter::Line(std::string_view text)

@@ -9,6 +9,14 @@
 
 namespace gw {
 
+/// The platform's line end.
+inline constexpr std::string_view kTextLineEnd =
+#ifdef _WIN32
+    "\r\n";
+#else
+    "\n";
+#endif
+
 /// Lines of text on their way into a sink. The text goes out in pieces, so that it is never in memory as a
 /// whole.
 class CLineWriter
@@ -27,11 +35,19 @@ public:
     void EndLine();
     void Line(std::string_view text);
 
+    /// For rows that are formatted in one go: where that many bytes can be written. Taken says where they
+    /// end.
+    char* Room(size_t byteCount)
+    {
+        return m_kBuffer.size() - m_uiUsed >= byteCount ? m_kBuffer.data() + m_uiUsed : MakeRoom(byteCount);
+    }
+    void Taken(const char* end) { m_uiUsed = static_cast<size_t>(end - m_kBuffer.data()); }
+
     /// Hands on what is left. False when the sink refused anything since the start.
     bool Flush();
 
 private:
-    char* Room(size_t byteCount);
+    char* MakeRoom(size_t byteCount);
 
     static constexpr size_t kPieceBytes = size_t{1} << 16; // stays in the cache of a core
 

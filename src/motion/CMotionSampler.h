@@ -23,6 +23,8 @@ public:
     void PoseTree(float time);
     /// Whether PoseNode may be called.
     bool PosesNodes() const { return m_bPosesNodes; }
+    /// The track that alone poses a node, or null if the node does not move.
+    const CKeyframeControl* TrackOf(size_t index) const { return m_kTracks[index]; }
     /// Brings the local matrix of one node to a time.
     void PoseNode(size_t index, float time);
 

@@ -3,6 +3,7 @@
 #include "CHTRReader.h"
 #include "CTextLines.h"
 #include "Numbers.h"
+#include "ReadFloat.h"
 #include "TKHTRFile.h"
 #include "Text.h"
 

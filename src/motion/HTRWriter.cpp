@@ -5,8 +5,11 @@
 // kept. In any other tree all nodes must be posed for a frame at once, and the rows wait for their turn.
 
 #include "BoneMeshQueries.h"
+#include "CHTRRowText.h"
+#include "CKeyframeControl.h"
 #include "CLineWriter.h"
 #include "CMotionSampler.h"
+#include "CTrackSampler.h"
 #include "Euler.h"
 #include "Skeleton.h"
 #include "TKHTRFile.h"
@@ -24,21 +27,15 @@ constexpr float kFrameLimit = 1 << 24;             // frame numbers beyond are n
 constexpr size_t kRowBytesLimit = size_t{1} << 31; // of rows that wait
 constexpr size_t kNoNode = std::numeric_limits<size_t>::max();
 
-struct Row
+// Only the root carries its translation.
+CHTRRow RowOf(const Mat4& local, bool isRoot, const TKHTRSegment& segment)
 {
-    Vec3 translation = kVec3Zero;
-    Vec3 degrees = kVec3Zero;
-    float scale = 1.0f;
-};
-
-Row RowOf(const CNode& node, const TKHTRSegment& segment)
-{
-    const Mat4& local = node.m_kMatrix;
-    Row row;
-    if (!node.GetParent())
+    const double length = Vec3Length(local.Row(0));
+    CHTRRow row;
+    if (isRoot)
         row.translation = local.Translation() - segment.baseTranslation;
-    row.degrees = Mat3ToEulerDegrees(NormalizedRows(local)) - segment.baseRotation;
-    row.scale = static_cast<float>(Vec3Length(local.Row(0)));
+    row.degrees = RowsToEulerDegrees(local, length) - segment.baseRotation;
+    row.scale = static_cast<float>(length);
     return row;
 }
 
@@ -82,7 +79,7 @@ std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
     return times;
 }
 
-/// The rows of all segments, made when they are asked for or, where they depend on each other, beforehand.
+/// The rows of all segments, computed as they are written or, if they depend on each other, beforehand.
 class CRows
 {
 public:
@@ -97,7 +94,7 @@ public:
     {
         if (m_kSampler.PosesNodes())
             return true;
-        if (m_kTimes.size() > kRowBytesLimit / sizeof(Row) / m_kFile.segments.size())
+        if (m_kTimes.size() > kRowBytesLimit / sizeof(CHTRRow) / m_kFile.segments.size())
             return false;
         m_kWaiting.resize(m_kTimes.size() * m_kFile.segments.size());
         for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
@@ -109,7 +106,37 @@ public:
         return true;
     }
 
-    Row At(size_t segment, size_t frame)
+    void Write(CLineWriter& out, size_t segment)
+    {
+        const size_t node = m_kNodeOfSegment[segment];
+        const CKeyframeControl* track =
+            m_kWaiting.empty() && node != kNoNode ? m_kSampler.TrackOf(node) : nullptr;
+        if (track && CTrackSampler::CanSample(*track))
+            return WriteSampled(out, segment, *track);
+        CHTRRowText text;
+        for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
+            text.Write(out, NumberOf(frame), At(segment, frame));
+    }
+
+private:
+    static int NumberOf(size_t frame) { return static_cast<int>(frame) + 1; }
+
+    // The usual case: nearly all of a save is spent here.
+    void WriteSampled(CLineWriter& out, size_t segment, const CKeyframeControl& track) const
+    {
+        const bool isRoot = !m_kSampler.Nodes()[m_kNodeOfSegment[segment]]->GetParent();
+        CTrackSampler sampler(track);
+        CHTRRowText text;
+        for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
+        {
+            if (sampler.MoveTo(m_kTimes[frame]))
+                text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, *m_kFile.segments[segment]));
+            else
+                text.Repeat(out, NumberOf(frame));
+        }
+    }
+
+    CHTRRow At(size_t segment, size_t frame)
     {
         if (!m_kWaiting.empty())
             return m_kWaiting[segment * m_kTimes.size() + frame];
@@ -118,18 +145,20 @@ public:
         return PosedRow(segment);
     }
 
-private:
-    Row PosedRow(size_t segment) const
+    CHTRRow PosedRow(size_t segment) const
     {
-        const size_t node = m_kNodeOfSegment[segment];
-        return node == kNoNode ? Row() : RowOf(*m_kSampler.Nodes()[node], *m_kFile.segments[segment]);
+        const size_t index = m_kNodeOfSegment[segment];
+        if (index == kNoNode)
+            return {};
+        const CNode& node = *m_kSampler.Nodes()[index];
+        return RowOf(node.m_kMatrix, !node.GetParent(), *m_kFile.segments[segment]);
     }
 
     const TKHTRFile& m_kFile;
     std::vector<float> m_kTimes;
     CMotionSampler m_kSampler;
     std::vector<size_t> m_kNodeOfSegment;
-    std::vector<Row> m_kWaiting; // segment by segment
+    std::vector<CHTRRow> m_kWaiting; // segment by segment
 };
 
 void Write(CLineWriter& out, const TKHTRFile& file, const CHTRText& field)
@@ -192,14 +221,7 @@ void WriteRows(CLineWriter& out, const TKHTRFile& file, CRows& rows)
     {
         out.Text("[").Text(file.segments[segment]->name).Line("]");
         out.Line("#Fr\tTx\tTy\tTz\tRx\tRy\tRz\tSF");
-        for (int frame = 0; frame < file.numFrames; ++frame)
-        {
-            const Row row = rows.At(segment, static_cast<size_t>(frame));
-            out.Int(frame + 1);
-            WriteVector(out, row.translation);
-            WriteVector(out, row.degrees);
-            out.Text(" ").Number(row.scale).EndLine();
-        }
+        rows.Write(out, segment);
     }
 }
 

@@ -160,7 +160,7 @@ void WriteKeys(const std::vector<CPoseMatcher::Bone>& bones, const std::vector<C
         if (!bones[bone].posed)
             continue;
         tracks[bone]->m_kRotationKeys[frame] = QuatFromMat3(bones[bone].rotation);
-        tracks[bone]->m_kPositionKeys[frame] = bones[bone].translation;
+        tracks[bone]->m_kPositionKeys.Set(frame, bones[bone].translation);
     }
 }
 

@@ -2,6 +2,8 @@
 
 #include "CNode.h"
 
+#include <algorithm>
+#include <string_view>
 #include <vector>
 
 namespace gw {
@@ -23,5 +25,24 @@ inline std::vector<CNode*> NodesOf(CNode& root)
         nodes.push_back(static_cast<CNode*>(object));
     return nodes;
 }
+
+/// The nodes of a tree by their exact names, for several look-ups while the tree does not change. Bodies have
+/// few nodes; a search of the tree looks at everything that hangs on them as well.
+class CNodeNames
+{
+public:
+    explicit CNodeNames(CNode& root) : m_kNodes(NodesOf(root)) {}
+
+    /// What FindNode returns.
+    CNode* Find(std::string_view name) const
+    {
+        const auto has = [=](const CNode* node) { return node->GetName() && node->NameView() == name; };
+        const auto found = std::ranges::find_if(m_kNodes, has);
+        return found == m_kNodes.end() ? nullptr : *found;
+    }
+
+private:
+    std::vector<CNode*> m_kNodes;
+};
 
 } // namespace gw

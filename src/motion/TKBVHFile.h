@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CKeyArray.h"
 #include "Quat.h"
 #include "Vec3.h"
 
@@ -39,7 +40,7 @@ struct TKBVHJoint
 
     // One key a frame, made of the row's values as they are read; none for a joint without channels.
     std::vector<Quat> rotationKeys;
-    std::vector<Vec3> positionKeys; ///< offset included
+    CKeyArray<Vec3> positionKeys; ///< offset included
 
     bool MakesNode() const { return kind != EJointKind::EndSite; }
     TKBVHJoint& AddChild(EJointKind childKind)

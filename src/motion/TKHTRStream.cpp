@@ -32,10 +32,10 @@ std::vector<size_t> AxesOf(std::string_view order)
 Mat3 RotatedBase(const std::vector<size_t>& axes, const Vec3& degrees, const Mat3& base)
 {
     const float angles[] = {degrees.x, degrees.y, degrees.z};
-    Mat3 m = base;
+    CAxisRotation m(base);
     for (const size_t axis : axes)
-        RotateRows(m, axis, angles[axis] * kDegreesToRadians);
-    return m;
+        m.RotateRows(axis, angles[axis] * kDegreesToRadians);
+    return m.Matrix();
 }
 
 Mat4 BaseMatrix(const TKHTRFile& file, const TKHTRSegment& segment)

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CFailure.h"
+#include "CKeyArray.h"
 #include "CText.h"
 #include "CVersion.h"
 #include "Mat4.h"
@@ -119,19 +120,19 @@ public:
     /// Whether the file has at least a version; always true where no old file is read.
     bool AtLeast(CVersion version) const { return m_kVersion.AtLeast(version); }
 
-    void Bool(const char* name, bool& value) { Values(name, EFieldKind::Bool, &value, 1); }
-    void Byte(const char* name, uint8_t& value) { Values(name, EFieldKind::Byte, &value, 1); }
-    void Word(const char* name, uint16_t& value) { Values(name, EFieldKind::Word, &value, 1); }
-    void Unsigned(const char* name, uint32_t& value) { Values(name, EFieldKind::Unsigned, &value, 1); }
-    void Signed(const char* name, int32_t& value) { Values(name, EFieldKind::Signed, &value, 1); }
-    void Float(const char* name, float& value) { Values(name, EFieldKind::Float, &value, 1); }
-    void Vector(const char* name, Vec3& value) { Values(name, EFieldKind::Vector, &value, 1); }
-    void Matrix(const char* name, Mat4& value) { Values(name, EFieldKind::Matrix, &value, 1); }
+    void Bool(const char* name, bool& value) { Plain(name, EFieldKind::Bool, &value, 1); }
+    void Byte(const char* name, uint8_t& value) { Plain(name, EFieldKind::Byte, &value, 1); }
+    void Word(const char* name, uint16_t& value) { Plain(name, EFieldKind::Word, &value, 1); }
+    void Unsigned(const char* name, uint32_t& value) { Plain(name, EFieldKind::Unsigned, &value, 1); }
+    void Signed(const char* name, int32_t& value) { Plain(name, EFieldKind::Signed, &value, 1); }
+    void Float(const char* name, float& value) { Plain(name, EFieldKind::Float, &value, 1); }
+    void Vector(const char* name, Vec3& value) { Plain(name, EFieldKind::Vector, &value, 1); }
+    void Matrix(const char* name, Mat4& value) { Plain(name, EFieldKind::Matrix, &value, 1); }
     /// Values in a row with no count of their own.
     template <class R>
     void Row(const char* name, R& values)
     {
-        Values(name, FieldKind<typename R::value_type>(), values.data(), values.size());
+        Plain(name, FieldKind<typename R::value_type>(), values.data(), values.size());
     }
 
     /// A length and its characters.
@@ -173,12 +174,18 @@ public:
     template <class T>
     void Block(const char* name, std::vector<T>& values)
     {
+        if (m_bLinksOnly)
+            return;
         Elements(name, values, Count(name, values.size(), sizeof(T)));
     }
+    template <class T>
+    void Block(const char* name, CKeyArray<T>& keys);
     /// The same with a signed count, of which those below 0 are none.
     template <class T>
     void SignedBlock(const char* name, std::vector<T>& values)
     {
+        if (m_bLinksOnly)
+            return;
         int32_t stored = 0;
         if (IsReading())
             Signed(name, stored);
@@ -190,6 +197,8 @@ public:
     template <class T>
     void OptionalBlock(const char* name, std::vector<T>& values, int64_t count)
     {
+        if (m_bLinksOnly)
+            return;
         const bool present = Presence(name, !values.empty());
         if (IsReading() && present && count < 0)
             Refuse(EFailure::BadCount);
@@ -216,8 +225,13 @@ public:
 
 protected:
     CFieldArchive(bool reading, CVersion version) : m_kVersion(version), m_bReading(reading) {}
+    /// For an archive that only looks at links. It is not shown plain values, which every search of a tree
+    /// would have to skip by one virtual call each.
+    explicit CFieldArchive(CVersion version) : m_kVersion(version), m_bReading(false), m_bLinksOnly(true) {}
 
     virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
+    /// The same value, so many times.
+    virtual void Repeated(const char* name, EFieldKind kind, const void* value, size_t count);
     virtual void Slot(const char* name, const CLinkSlot& slot) = 0;
     virtual void BeginArray(const char*, EListKind) {}
     virtual void EndArray() {}
@@ -225,11 +239,17 @@ protected:
     virtual void EndElement() {}
 
 private:
+    void Plain(const char* name, EFieldKind kind, void* values, size_t count)
+    {
+        if (!m_bLinksOnly)
+            Values(name, kind, values, count);
+    }
     template <class T>
     void Elements(const char* name, std::vector<T>& values, size_t count);
 
     CVersion m_kVersion;
     bool m_bReading;
+    bool m_bLinksOnly = false;
 };
 
 /// Adds up the bytes that fields take in a file.
@@ -245,6 +265,7 @@ public:
 
 protected:
     void Values(const char* name, EFieldKind kind, void* values, size_t count) override;
+    void Repeated(const char* name, EFieldKind kind, const void* value, size_t count) override;
     void Slot(const char* name, const CLinkSlot& slot) override;
 
 private:
@@ -269,6 +290,21 @@ void CFieldArchive::Elements(const char* name, std::vector<T>& values, size_t co
     }
 }
 
+template <class T>
+void CFieldArchive::Block(const char* name, CKeyArray<T>& keys)
+{
+    if (m_bLinksOnly)
+        return;
+    const size_t count = Count(name, keys.size(), sizeof(T));
+    if (!IsReading() && keys.Distinct().size() < count)
+        return Repeated(name, FieldKind<T>(), &keys.front(), count);
+    if (!IsReading())
+        return Elements(name, keys.Expand(), count);
+    std::vector<T> values;
+    Elements(name, values, count);
+    keys = std::move(values);
+}
+
 template <class T, class F>
 void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
 {
@@ -291,7 +327,7 @@ template <class F>
 class CLinkVisitor : public CFieldArchive
 {
 public:
-    explicit CLinkVisitor(F visit) : CFieldArchive(false, kNewestVersion), m_kVisit(visit) {}
+    explicit CLinkVisitor(F visit) : CFieldArchive(kNewestVersion), m_kVisit(visit) {}
 
     void Text(const char*, CText&) override {}
     bool Presence(const char*, bool present) override { return present; }

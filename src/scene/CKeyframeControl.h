@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CControl.h"
+#include "CKeyArray.h"
 #include "KeySpan.h"
 #include "Mat4.h"
 #include "Quat.h"
@@ -39,8 +40,8 @@ public:
     bool m_bHasRestMatrix = false;      ///< m_kRestMatrix is valid
     Mat4 m_kRestMatrix = kMat4Identity; ///< written to the target while the control is inactive
     std::vector<Quat> m_kRotationKeys;
-    std::vector<Vec3> m_kPositionKeys;
-    std::vector<Vec3> m_kScaleKeys;
+    CKeyArray<Vec3> m_kPositionKeys;
+    CKeyArray<Vec3> m_kScaleKeys;
     std::vector<float> m_kKeyTimes; ///< the axis that the three tracks share
     std::vector<float> m_kRotationTimes;
     std::vector<float> m_kPositionTimes;

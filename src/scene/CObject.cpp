@@ -10,6 +10,8 @@
 #include "HTMLText.h"
 
 #include <cstring>
+#include <iterator>
+#include <span>
 #include <unordered_set>
 
 namespace gw {
@@ -57,6 +59,42 @@ void ForEachModifier(CObject* head, F visit)
          modifier = RecordCast<CModifier>(modifier->GetNext()))
         visit(*modifier);
 }
+
+// The objects that one keeps alive. Collected first and visited then, so that walks which recurse spend one
+// small frame a level; every search comes by here, so that the usual number needs no allocation.
+class CHeldObjects
+{
+public:
+    explicit CHeldObjects(CObject& object)
+    {
+        CLinkVisitor visitor([this](const CLinkSlot& slot) {
+            if (CObject* held = slot.IsCounted() ? slot.Get() : nullptr)
+                Add(held);
+        });
+        object.Fields(visitor);
+    }
+    std::span<CObject* const> All() const
+    {
+        return m_kMany.empty() ? std::span<CObject* const>(m_apkFew, m_uiFew) : m_kMany;
+    }
+
+private:
+    void Add(CObject* object)
+    {
+        if (m_kMany.empty() && m_uiFew < std::size(m_apkFew))
+        {
+            m_apkFew[m_uiFew++] = object;
+            return;
+        }
+        if (m_kMany.empty())
+            m_kMany.assign(m_apkFew, m_apkFew + m_uiFew);
+        m_kMany.push_back(object);
+    }
+
+    CObject* m_apkFew[6];
+    size_t m_uiFew = 0;
+    std::vector<CObject*> m_kMany; // all, where they are too many
+};
 
 template <class F>
 void UpdateChains(CObject& object, F update)
@@ -245,28 +283,18 @@ bool CObject::Fits(const char* name, const CRTTI* record, bool derived) const
     return !name || (!m_pcName.IsNull() && m_pcName.View() == name);
 }
 
-// Collected first and visited then, so that walks which recurse spend one small frame a level.
 std::vector<CObject*> CObject::HeldObjects()
 {
-    constexpr size_t kUsual =
-        8; // every search comes by here: growing would take three allocations for a node
-    std::vector<CObject*> held;
-    CLinkVisitor visitor([&](const CLinkSlot& slot) {
-        CObject* object = slot.IsCounted() ? slot.Get() : nullptr;
-        if (object && held.empty())
-            held.reserve(kUsual);
-        if (object)
-            held.push_back(object);
-    });
-    Fields(visitor);
-    return held;
+    const CHeldObjects held(*this);
+    return {held.All().begin(), held.All().end()};
 }
 
 CObject* CObject::FindObject(const char* name, const CRTTI* record, bool derived)
 {
     if (Fits(name, record, derived))
         return this;
-    for (CObject* held : HeldObjects())
+    const CHeldObjects all(*this);
+    for (CObject* held : all.All())
     {
         if (CObject* found = held->FindObject(name, record, derived))
             return found;
@@ -278,7 +306,8 @@ void CObject::FindObjects(std::vector<CObject*>& found, const char* name, const 
 {
     if (Fits(name, record, derived))
         found.push_back(this);
-    for (CObject* held : HeldObjects())
+    const CHeldObjects all(*this);
+    for (CObject* held : all.All())
         held->FindObjects(found, name, record, derived);
 }
 

@@ -63,7 +63,7 @@ class CLinkResolver : public CFieldArchive
 {
 public:
     CLinkResolver(const COrrinStream& stream, CLinkRecord& record)
-        : CFieldArchive(false, stream.GetVersion()), m_kStream(stream), m_kRecord(record)
+        : CFieldArchive(stream.GetVersion()), m_kStream(stream), m_kRecord(record)
     {
     }
 

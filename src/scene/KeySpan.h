@@ -1,5 +1,7 @@
 #pragma once
 
+#include "CKeyArray.h"
+
 #include <algorithm>
 #include <cstddef>
 #include <cstdint>
@@ -31,9 +33,15 @@ const T& KeyAt(const std::vector<T>& keys, uint32_t index)
     return keys[std::min<size_t>(index, keys.size() - 1)];
 }
 
-/// The value between two keys; `empty` where there are none.
 template <class T>
-T LinearKey(const std::vector<T>& keys, const KeySpan& span, const T& empty)
+const T& KeyAt(const CKeyArray<T>& keys, uint32_t index)
+{
+    return keys[index];
+}
+
+/// The value between two keys; `empty` where there are none. Keys is a vector or a CKeyArray.
+template <class Keys, class T>
+T LinearKey(const Keys& keys, const KeySpan& span, const T& empty)
 {
     if (keys.empty())
         return empty;

@@ -277,7 +277,7 @@ TEST(AlignMotion, KeepsPositionsThatVary)
     const CMadeBody told(telling);
     auto& track = static_cast<CKeyframeControl&>(*told.Joint("LHand").GetControl());
     for (size_t frame = 3; frame < track.m_kPositionKeys.size(); ++frame)
-        track.m_kPositionKeys[frame].y += 0.1f * static_cast<float>(frame);
+        track.m_kPositionKeys.Expand()[frame].y += 0.1f * static_cast<float>(frame);
     const AlignedMotion aligned = Align(told);
     for (const int frame : {0, 2, 3, 39})
     {
@@ -340,7 +340,7 @@ TEST(PlanAlignment, LeavesABodyThatLiesOnTheGroundLying)
     const CMadeBody told(telling);
     auto& root = static_cast<CKeyframeControl&>(*told.Joint("LowerTorso").GetControl());
     root.m_kRestMatrix.SetTranslation({0, 90, 0});
-    for (Vec3& place : root.m_kPositionKeys)
+    for (Vec3& place : root.m_kPositionKeys.Expand())
         place = place + Vec3{150, 0, 220};
     AlignReport report;
     Align(told, &report);

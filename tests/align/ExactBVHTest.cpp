@@ -74,7 +74,7 @@ TEST(WriteExact, GivesPositionsToJointsThatMove)
 {
     const CMadeBody body{{}};
     auto& track = static_cast<CKeyframeControl&>(*body.Joint("LHand").GetControl());
-    track.m_kPositionKeys[17].y += 2.5f;
+    track.m_kPositionKeys.Expand()[17].y += 2.5f;
     std::string text;
     ExpectReadsAgain(*body.Motion().root, body.Motion().frequency, 40, text);
     const size_t hand = text.find("JOINT LHand");

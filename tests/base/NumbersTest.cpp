@@ -1,4 +1,5 @@
 #include "Numbers.h"
+#include "ReadFloat.h"
 
 #include "TempFolder.h"
 

@@ -136,6 +136,9 @@ TEST(Euler, DegreesRebuildAWholeTurnAndAreNeverNaN)
         const Mat3 m = EulerToMat3("ZYX", degrees);
         const Vec3 angles = Mat3ToEulerDegrees(m);
         ASSERT_LT(DegreesBetween(EulerToMat3("ZYX", angles), m), 1e-3) << degrees.x << ' ' << degrees.y;
+        const Mat4 scaled = Mat4Compose(m, kVec3One, {2.0f, 0.7f, 3.1f});
+        ASSERT_EQ(RowsToEulerDegrees(scaled, Vec3Length(scaled.Row(0))),
+                  Mat3ToEulerDegrees(NormalizedRows(scaled)));
     }
     ExpectNear(Mat3ToEulerDegrees(About('X', -100.0f)), {260.0f, 0.0f, 0.0f}, 1e-3);
     const Mat3 upright{

@@ -246,7 +246,8 @@ TEST_F(Faithful, OddSourcesGiveFiniteKeys)
                 place->x += row.place;
             return pose;
         });
-        static_cast<CKeyframeControl*>(walker.Root().GetControl())->m_kPositionKeys.back().z += row.jump;
+        static_cast<CKeyframeControl*>(walker.Root().GetControl())->m_kPositionKeys.Expand().back().z +=
+            row.jump;
         m_kTarget = MakeTargetLegs();
         PairWalker(m_kRetargeter, walker, *m_kTarget);
         Run(row.frameCount);

@@ -349,8 +349,14 @@ TEST(TKHTRStream, WritesThePosesOfTheTree)
     EXPECT_NE(ReadBytes(path), plain) << "the parent's rotation is undone";
     track->m_uiParentMask = 0;
     FindBoneMesh(*file.motion.motionRoot)->AttachControl(new CKeyframeControl);
-    ASSERT_TRUE(file.motion.Save(path, 2.0f));
-    EXPECT_EQ(ReadBytes(path), plain) << "a control that has nothing to do with the nodes";
+    for (const float frameScale : {2.0f, 4.0f, 7.0f})
+    {
+        CLoadedMotion bySegments(text, "c.htr");
+        ASSERT_TRUE(bySegments.motion.Save(bySegments.path, frameScale));
+        ASSERT_TRUE(file.motion.Save(path, frameScale));
+        EXPECT_EQ(ReadBytes(path), ReadBytes(bySegments.path))
+            << "a control that has nothing to do with the nodes";
+    }
 }
 
 // A name means the first of its bearers, and each of them has a section of its own when the motion is

@@ -307,7 +307,7 @@ TEST_F(CRetargeterTest, LegsChangeThighsAndCalvesAndNothingElse)
 TEST_F(CRetargeterTest, TheRootStartsAtTheRootPositionAndFollowsTheScaledHip)
 {
     ASSERT_TRUE(Run());
-    const std::vector<Vec3>& keys = TrackOf(*m_kTarget).m_kPositionKeys;
+    const CKeyArray<Vec3>& keys = TrackOf(*m_kTarget).m_kPositionKeys;
     ASSERT_EQ(keys.size(), 10u);
     EXPECT_EQ(keys[0], kRootPosition);
     const Vec3 step = keys[1] - keys[0];
@@ -360,8 +360,8 @@ TEST_F(CRetargeterTest, RestScalesSurviveAScaledSource)
 {
     for (CNode* node : NodesOf(*m_kSource))
     {
-        for (Vec3& scale : TrackOf(*node).m_kScaleKeys)
-            scale = {1.5f, 1.5f, 1.5f};
+        CKeyArray<Vec3>& scales = TrackOf(*node).m_kScaleKeys;
+        scales.assign(scales.size(), {1.5f, 1.5f, 1.5f});
     }
     Target("LForearm")->m_kMatrix = Mat4Compose(kMat3Identity, {0, 285, 0}, {1.0f, 1.2f, 1.0f});
     ASSERT_TRUE(Run(false));

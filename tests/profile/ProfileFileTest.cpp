@@ -1,5 +1,8 @@
 // The profile file as text: what its lines say, and what the reader makes of lines that say too little.
+#include "CProfileTexts.h"
 #include "ProfileFixture.h"
+
+#include <filesystem>
 
 #include <random>
 
@@ -35,6 +38,50 @@ std::string ReadAll(std::string_view text)
 }
 
 } // namespace
+
+TEST(CProfileTexts, ThePackStandsForFilesThatAreAsTheyWere)
+{
+    using namespace std::chrono_literals;
+    const std::string pack = "A.prf 8\npacked A"
+                             "B.prf 8\npacked B";
+    const struct
+    {
+        const char* what;
+        std::string pack, a;
+        std::chrono::seconds age; // of A.prf, at the pack's time
+        const char* names;
+    } rows[] = {
+        {"as packed",           pack,          "edited A",              10s,                              "packed A|packed B|" },
+        {"of one time",         pack,          "edited A",              0s,                               "packed A|packed B|" },
+        {"edited since",        pack,          "edited A",              -10s,                             "edited A|packed B|" },
+        {"of another size",     pack,          "another A",             10s,                              "another A|packed B|"},
+        {"gone",                pack,          "",                      0s,                               "packed B|"          },
+        {"no pack",             "",            "edited A",              10s,                              "edited A|edited B|" },
+        {"a pack that was cut", pack.substr(0, 20),                     "edited A",                       10s,                   "packed A|edited B|"},
+        {"not a pack",                     "A.prf 99999999999\nabcd",                       "edited A", 10s, "edited A|edited B|"                  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CTempFolder folder;
+        WriteBytes(folder.Path("B.prf"), "edited B");
+        WriteBytes(folder.Path(kProfilePack), row.pack);
+        const auto time = std::filesystem::last_write_time(folder.Path(kProfilePack));
+        std::filesystem::last_write_time(folder.Path("B.prf"), time);
+        if (!row.a.empty())
+        {
+            WriteBytes(folder.Path("A.prf"), row.a);
+            std::filesystem::last_write_time(folder.Path("A.prf"), time - row.age);
+        }
+        std::string names;
+        for (const CProfileTexts texts(folder.Path()); const CProfileTexts::Entry& entry : texts.Entries())
+        {
+            EXPECT_EQ(entry.text, entry.name);
+            names += entry.name + '|';
+        }
+        EXPECT_EQ(names, row.names);
+    }
+}
 
 TEST(ProfileReader, LinesSayWhatTheirFormSays)
 {

@@ -4,8 +4,10 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <cstring>
 #include <limits>
 #include <numbers>
+#include <random>
 
 namespace gw {
 
@@ -37,6 +39,42 @@ CKeyframeControl& Track(CNode& node)
 }
 
 } // namespace
+
+TEST(CKeyArray, HoldsWhatAVectorWouldAndOneKeyWhileAllAreEqual)
+{
+    std::mt19937 random(7);
+    size_t sharedCount = 0;
+    for (int round = 0; round < 300; ++round)
+    {
+        CKeyArray<Vec3> keys;
+        std::vector<Vec3> plain;
+        const unsigned choice = random() % 3; // how many values there are
+        const auto next = [&] {
+            return Vec3{0.0f, random() % 2 ? 0.0f : -0.0f, static_cast<float>(random() % (choice + 1))};
+        };
+        keys.assign(random() % 3, choice ? next() : kVec3Zero);
+        plain.assign(keys.size(), keys.empty() ? kVec3Zero : keys.front());
+        for (int step = 0; step < 9; ++step)
+        {
+            const Vec3 key = choice ? next() : kVec3Zero;
+            if (const size_t index = random() % (plain.size() + 1); index < plain.size())
+                keys.Set(index, plain[index] = key);
+            else
+            {
+                keys.push_back(key);
+                plain.push_back(key);
+            }
+        }
+        ASSERT_EQ(keys.size(), plain.size());
+        for (size_t i = 0; i < plain.size(); ++i)
+            ASSERT_EQ(std::memcmp(&keys[i], &plain[i], sizeof(Vec3)), 0) << round;
+        EXPECT_EQ(keys[plain.size() + 5], plain.back());
+        EXPECT_EQ(CKeyArray<Vec3>(plain), keys);
+        sharedCount += keys.Distinct().size() == 1 ? 1 : 0;
+        EXPECT_TRUE(choice || keys.Distinct().size() == 1);
+    }
+    EXPECT_LT(sharedCount, 200u);
+}
 
 TEST(CControl, MapsTimesByFrequencyPhaseAndCycle)
 {

@@ -1,0 +1,93 @@
+#pragma once
+
+#include <algorithm>
+#include <cstddef>
+#include <cstring>
+#include <initializer_list>
+#include <span>
+#include <type_traits>
+#include <utility>
+#include <vector>
+
+namespace gw {
+
+/// The keys of a track. As long as all of them are equal, bit for bit, only one is stored: most bones never
+/// change their length, and nearly none its scale. Indexes beyond the end give the last key; there must be
+/// one.
+template <class T>
+class CKeyArray
+{
+    static_assert(std::is_trivially_copyable_v<T>);
+
+public:
+    CKeyArray() = default;
+    CKeyArray(std::initializer_list<T> keys) : CKeyArray(std::vector<T>(keys)) {}
+    /// Keeps one key if all are equal.
+    CKeyArray(std::vector<T> keys) : m_uiSize(keys.size())
+    {
+        const auto differs = [&](const T& key) { return !IsSame(key, keys.front()); };
+        if (std::ranges::any_of(keys, differs))
+            m_kStored = std::move(keys);
+        else if (!keys.empty())
+            m_kStored.assign(1, keys.front());
+    }
+
+    size_t size() const { return m_uiSize; }
+    bool empty() const { return m_uiSize == 0; }
+    const T& operator[](size_t index) const { return m_kStored[std::min(index, m_kStored.size() - 1)]; }
+    const T& front() const { return m_kStored.front(); }
+    const T& back() const { return m_kStored.back(); }
+    /// What is stored: one key if all are equal, otherwise all.
+    std::span<const T> Distinct() const { return m_kStored; }
+
+    /// As many keys as will come. Takes no memory until they differ.
+    void reserve(size_t count) { m_uiExpected = count; }
+    void assign(size_t count, const T& key)
+    {
+        m_kStored.assign(count > 0 ? 1 : 0, key);
+        m_uiSize = count;
+    }
+    void push_back(const T& key)
+    {
+        if (m_uiSize == 0)
+            m_kStored.assign(1, key);
+        else if (m_kStored.size() != 1 || !IsSame(key, m_kStored.front()))
+            Expand().push_back(key);
+        ++m_uiSize;
+    }
+    /// Replaces the key at an index below size().
+    void Set(size_t index, const T& key)
+    {
+        if (m_kStored.size() != 1 || !IsSame(key, m_kStored.front()))
+            Expand()[index] = key;
+    }
+    /// All keys, each with its own place, to be changed there. Their number must stay.
+    std::vector<T>& Expand()
+    {
+        if (m_kStored.size() < m_uiSize)
+        {
+            m_kStored.reserve(std::max(m_uiExpected, m_uiSize + 1));
+            m_kStored.resize(m_uiSize, T(m_kStored.front()));
+        }
+        return m_kStored;
+    }
+
+    friend bool operator==(const CKeyArray& a, const CKeyArray& b)
+    {
+        for (size_t i = 0; i < std::min(a.size(), b.size()); ++i)
+        {
+            if (!(a[i] == b[i]))
+                return false;
+        }
+        return a.size() == b.size();
+    }
+
+private:
+    static bool IsSame(const T& a, const T& b) { return std::memcmp(&a, &b, sizeof(T)) == 0; }
+
+    std::vector<T> m_kStored; // no key, one for all, or all
+    size_t m_uiSize = 0;
+    size_t m_uiExpected = 0;
+};
+
+} // namespace gw
