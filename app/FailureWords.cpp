@@ -36,6 +36,8 @@ constexpr Words<EFailure> kFailures[] = {
     Row(NotFound, "not-found", "the file cannot be opened", "check the path and the permissions"),
     Row(NotRegular, "not-regular", "this is a folder or a device, not a file"),
     Row(ReadError, "read-error", "the file system failed while reading", "check the disk or the network"),
+    Row(Changed, "changed", "the file was truncated while it was read", "try again when it is complete"),
+    Row(Exists, "exists", "the file exists; --force replaces it"),
     Row(WriteError, "write-error", "the file cannot be written", "check free space and permissions"),
     Row(OutOfMemory, "out-of-memory", "this takes more memory than there is"),
     Row(UnknownFormat, "unknown-format", "no reader for this kind of file",

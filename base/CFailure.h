@@ -15,7 +15,9 @@ enum class EFailure : uint8_t
     NotFound,       ///< the file cannot be opened or examined
     NotRegular,     ///< the path is a folder or a device
     ReadError,      ///< the file system failed while reading
+    Changed,        ///< another program cut the file short while it was read
     WriteError,     ///< the file system failed while writing: full disk, no permission
+    Exists,         ///< a file that may not be replaced, perhaps since it appeared meanwhile
     OutOfMemory,    ///< more memory than can be had
     UnknownFormat,  ///< no reader for this extension
     BadHeader,      ///< the file does not begin as it must

@@ -1,5 +1,7 @@
 #include "CMappedFile.h"
 
+#include "WatchedRange.h"
+
 #include <algorithm>
 #include <cerrno>
 #include <utility>
@@ -13,8 +15,8 @@ namespace gw {
 
 namespace {
 
-// Up to here reading takes less time than the pages and their faults.
-constexpr size_t kReadBytes = size_t{1} << 14;
+// Up to here reading takes no longer than mapping and its page faults, and cannot be disturbed later.
+constexpr size_t kReadBytes = size_t{1} << 20;
 
 void* PageAddress(const std::byte* bytes)
 {
@@ -30,7 +32,8 @@ CMappedFile::~CMappedFile()
 
 CMappedFile::CMappedFile(CMappedFile&& other) noexcept
     : m_spkSmall(std::move(other.m_spkSmall)), m_pkBytes(std::exchange(other.m_pkBytes, nullptr)),
-      m_uiSize(std::exchange(other.m_uiSize, 0))
+      m_uiSize(std::exchange(other.m_uiSize, 0)), m_iFile(std::exchange(other.m_iFile, -1)),
+      m_pkRange(std::exchange(other.m_pkRange, nullptr))
 {
 }
 
@@ -39,6 +42,8 @@ CMappedFile& CMappedFile::operator=(CMappedFile&& other) noexcept
     std::swap(m_spkSmall, other.m_spkSmall);
     std::swap(m_pkBytes, other.m_pkBytes);
     std::swap(m_uiSize, other.m_uiSize);
+    std::swap(m_iFile, other.m_iFile);
+    std::swap(m_pkRange, other.m_pkRange);
     return *this;
 }
 
@@ -50,7 +55,8 @@ EFailure CMappedFile::Open(const std::string& path)
     if (file < 0)
         return EFailure::NotFound;
     const EFailure failure = Take(file);
-    close(file);
+    if (m_iFile < 0)
+        close(file);
     return failure;
 }
 
@@ -75,12 +81,12 @@ EFailure CMappedFile::Read(int file, size_t size)
         if (count < 0 && errno != EINTR)
             return EFailure::ReadError;
         if (count == 0)
-            break; // somebody has cut it meanwhile
+            return EFailure::Changed;
         done += static_cast<size_t>(std::max<ssize_t>(count, 0));
     }
     m_spkSmall = std::move(bytes);
     m_pkBytes = m_spkSmall.get();
-    m_uiSize = done;
+    m_uiSize = size;
     return EFailure::None;
 }
 
@@ -89,17 +95,37 @@ EFailure CMappedFile::Map(int file, size_t size)
     void* const mapped = mmap(nullptr, size, PROT_READ, MAP_PRIVATE, file, 0);
     if (mapped == MAP_FAILED)
         return errno == ENOMEM ? EFailure::OutOfMemory : EFailure::ReadError;
+    m_pkRange = Watch(mapped, size);
+    if (!m_pkRange) // more files at a time than any program here maps
+    {
+        munmap(mapped, size);
+        return Read(file, size);
+    }
     // A hint only: files are read from front to back once.
     madvise(mapped, size, MADV_SEQUENTIAL);
     m_pkBytes = static_cast<const std::byte*>(mapped);
     m_uiSize = size;
+    m_iFile = file;
     return EFailure::None;
+}
+
+// A file that is cut inside its last page raises no signal.
+bool CMappedFile::IsWhole() const
+{
+    if (!IsMapped())
+        return true;
+    struct stat status;
+    return !m_pkRange->cut && fstat(m_iFile, &status) == 0 && static_cast<size_t>(status.st_size) >= m_uiSize;
 }
 
 void CMappedFile::Close()
 {
-    if (m_pkBytes && !m_spkSmall)
+    if (IsMapped())
+    {
+        Unwatch(std::exchange(m_pkRange, nullptr));
         munmap(PageAddress(m_pkBytes), m_uiSize);
+        close(std::exchange(m_iFile, -1));
+    }
     m_spkSmall.reset();
     m_pkBytes = nullptr;
     m_uiSize = 0;
@@ -107,7 +133,7 @@ void CMappedFile::Close()
 
 void CMappedFile::Forget(size_t endOffset)
 {
-    if (!m_pkBytes || m_spkSmall)
+    if (!IsMapped())
         return;
     const auto pageSize = static_cast<size_t>(sysconf(_SC_PAGESIZE));
     const size_t length = std::min(endOffset, m_uiSize) / pageSize * pageSize;

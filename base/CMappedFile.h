@@ -10,8 +10,11 @@
 
 namespace gw {
 
+struct CWatchedRange;
+
 /// The bytes of a regular file, mapped and not copied; a small one is read, which costs less. Folders and
-/// devices are refused. An empty file maps to no bytes.
+/// devices are refused. An empty file maps to no bytes. Bytes that a file loses while it is mapped read as
+/// zeros; see IsWhole.
 class CMappedFile
 {
 public:
@@ -26,6 +29,10 @@ public:
     EFailure Open(const std::string& path);
     void Close();
 
+    /// Whether the file still had all its bytes when they were read. To be asked after the last read: what
+    /// was read of a file that was cut short meanwhile is worth nothing. True when nothing is open.
+    bool IsWhole() const;
+
     std::span<const std::byte> Bytes() const { return {m_pkBytes, m_uiSize}; }
     std::string_view Text() const { return {reinterpret_cast<const char*>(m_pkBytes), m_uiSize}; }
     /// Gives back the pages before an offset that will not be read again; they are read anew if they are.
@@ -35,10 +42,13 @@ private:
     EFailure Take(int file);
     EFailure Read(int file, size_t size);
     EFailure Map(int file, size_t size);
+    bool IsMapped() const { return m_pkBytes && !m_spkSmall; }
 
     std::unique_ptr<std::byte[]> m_spkSmall; // where the bytes are not mapped
     const std::byte* m_pkBytes = nullptr;
     size_t m_uiSize = 0;
+    int m_iFile = -1;                   // of a mapping
+    CWatchedRange* m_pkRange = nullptr; // likewise
 };
 
 } // namespace gw

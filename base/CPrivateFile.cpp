@@ -1,9 +1,11 @@
 #include "CPrivateFile.h"
 
+#include "LiveNames.h"
 #include "Paths.h"
 #include "PrivateNames.h"
 
 #include <cerrno>
+#include <utility>
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -11,33 +13,82 @@
 
 namespace gw {
 
-int CreatePrivateFile(const std::string& folder, std::string_view extension, unsigned mode, std::string& path)
+bool WriteAll(int file, std::string_view text)
 {
-    constexpr int kAttempts = 16; // a second attempt is all but unheard of
-    for (int i = 0; i < kAttempts; ++i)
+    while (!text.empty())
     {
-        path = PrivateName(folder, extension);
-        const int file = open(path.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, mode);
-        if (file >= 0)
-            return file;
-        if (errno != EEXIST)
-            break;
+        const ssize_t written = write(file, text.data(), text.size());
+        if (written < 0 && errno != EINTR)
+            return false;
+        text.remove_prefix(written < 0 ? 0 : static_cast<size_t>(written));
     }
-    path.clear();
-    return -1;
+    return true;
+}
+
+bool WriteAllAt(int file, std::string_view text, uint64_t offset)
+{
+    while (!text.empty())
+    {
+        const ssize_t written = pwrite(file, text.data(), text.size(), static_cast<off_t>(offset));
+        if (written < 0 && errno != EINTR)
+            return false;
+        const size_t count = written < 0 ? 0 : static_cast<size_t>(written);
+        text.remove_prefix(count);
+        offset += count;
+    }
+    return true;
 }
 
 CPrivateFile::CPrivateFile(const std::string& besidePath, std::string_view extension)
 {
-    const int file = CreatePrivateFile(FolderOf(besidePath), extension, S_IRUSR | S_IWUSR, m_kPath);
-    if (file >= 0)
-        close(file);
+    Create(FolderOf(besidePath), extension, S_IRUSR | S_IWUSR);
 }
 
 CPrivateFile::~CPrivateFile()
 {
-    if (!m_kPath.empty())
+    Remove();
+}
+
+bool CPrivateFile::Create(const std::string& folder, std::string_view extension, unsigned mode)
+{
+    constexpr int kAttempts = 16; // a second one is almost unheard of
+    Remove();
+    SweepOnce(folder);
+    for (int i = 0; i < kAttempts; ++i)
+    {
+        m_kPath = PrivateName(folder, extension);
+        m_iLiveName = AddLiveName(m_kPath); // before the file exists, or a signal could come in between
+        m_iFile = open(m_kPath.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, mode);
+        const bool isTaken = m_iFile < 0 && errno == EEXIST;
+        if (m_iFile >= 0 && LockNewFile(m_iFile))
+            return true;
+        const bool isSwept = m_iFile >= 0;
+        Release();
+        if (!isTaken && !isSwept)
+            break;
+    }
+    return false;
+}
+
+bool CPrivateFile::Write(std::string_view text)
+{
+    return m_iFile >= 0 && ftruncate(m_iFile, 0) == 0 && WriteAllAt(m_iFile, text, 0);
+}
+
+void CPrivateFile::Remove()
+{
+    // While it is locked, or another program might do the same.
+    if (m_iFile >= 0)
         unlink(m_kPath.c_str());
+    Release();
+}
+
+void CPrivateFile::Release()
+{
+    if (m_iFile >= 0)
+        close(std::exchange(m_iFile, -1));
+    RemoveLiveName(std::exchange(m_iLiveName, -1));
+    m_kPath.clear();
 }
 
 } // namespace gw

@@ -1,11 +1,11 @@
 #include "CSafeFile.h"
 
-#include "CPrivateFile.h"
 #include "Paths.h"
-#include "PrivateNames.h"
 
 #include <cerrno>
+#include <cstdio>
 #include <filesystem>
+#include <set>
 #include <system_error>
 #include <utility>
 
@@ -18,7 +18,9 @@ namespace gw {
 namespace {
 
 constexpr unsigned kModeOfNew = 0666; // less the user's mask, as for any new file
-constexpr unsigned kModeBits = 07777;
+constexpr unsigned kModeWhileReplacing = 0600;
+constexpr unsigned kPermissions = 0777; // a set-id bit was granted to the old content
+constexpr unsigned kGroupBits = 070;
 // Not the destination's, so that nobody who lists a folder by extension finds a half-written file.
 constexpr std::string_view kPrivateExtension = ".tmp";
 
@@ -38,16 +40,45 @@ std::string FollowLinks(const std::string& path)
     return {};
 }
 
-// Whether a path is free or holds a file that may be replaced. `mode` becomes the file's, or 0 where the path
-// is free.
-bool MayReplace(const std::string& path, unsigned& mode)
+bool IsThere(const std::string& path)
 {
     struct stat status;
-    mode = 0;
-    if (stat(path.c_str(), &status) != 0)
-        return errno == ENOENT;
-    mode = status.st_mode & kModeBits;
-    return S_ISREG(status.st_mode) && !IsReadOnly(path);
+    return lstat(path.c_str(), &status) == 0;
+}
+
+std::set<std::string>& KeptPaths()
+{
+    static std::set<std::string> paths;
+    return paths;
+}
+
+// Claims a free name with an empty file, for file systems that have no links. A crash can leave that behind.
+bool RenameToClaimed(const char* from, const char* to)
+{
+    const int file = open(to, O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kModeWhileReplacing);
+    if (file < 0)
+        return false;
+    close(file);
+    if (rename(from, to) == 0)
+        return true;
+    unlink(to);
+    return false;
+}
+
+// Renames without replacing anything; EEXIST when there is something. The first call is missing on NFS and
+// some others, the second on FAT.
+bool RenameToFree(const char* from, const char* to)
+{
+    if (renameat2(AT_FDCWD, from, AT_FDCWD, to, RENAME_NOREPLACE) == 0)
+        return true;
+    if (errno != EINVAL && errno != ENOSYS && errno != ENOTSUP)
+        return false;
+    if (link(from, to) == 0)
+    {
+        unlink(from);
+        return true;
+    }
+    return errno != EEXIST && RenameToClaimed(from, to);
 }
 
 } // namespace
@@ -60,6 +91,11 @@ void CSafeFile::SetCommitGate(CommitGate gate)
     ms_kCommitGate = std::move(gate);
 }
 
+void CSafeFile::KeepExisting(const std::string& path)
+{
+    KeptPaths().insert(path);
+}
+
 CSafeFile::~CSafeFile()
 {
     Discard();
@@ -68,27 +104,39 @@ CSafeFile::~CSafeFile()
 bool CSafeFile::Open(const std::string& path)
 {
     Discard();
+    m_eFailure = EFailure::WriteError;
+    m_bKeeps = KeptPaths().erase(path) > 0;
+    if (m_bKeeps && IsThere(path))
+    {
+        m_eFailure = EFailure::Exists;
+        return false;
+    }
     m_kPath = FollowLinks(path);
     const std::string folder = FolderOf(m_kPath);
-    if (m_kPath == folder || !MayReplace(m_kPath, m_uiMode))
+    if (m_kPath == folder || !MayReplace())
         return false;
-    // A file that others may not read is not laid open while it is written.
-    const unsigned mode = m_uiMode ? m_uiMode : kModeOfNew;
-    m_iFile = CreatePrivateFile(folder, kPrivateExtension, mode, m_kPrivatePath);
-    return m_iFile >= 0;
+    // What others may not read is not laid open while it is written: the old permissions come with Commit.
+    if (!m_kPrivate.Create(folder, kPrivateExtension, m_uiMode ? kModeWhileReplacing : kModeOfNew))
+        return false;
+    m_eFailure = EFailure::None;
+    return true;
+}
+
+// Whether the path is free or holds a file that may be replaced, and as what.
+bool CSafeFile::MayReplace()
+{
+    struct stat status;
+    if (stat(m_kPath.c_str(), &status) != 0)
+        return errno == ENOENT;
+    m_uiMode = status.st_mode & kPermissions;
+    m_uiGroup = status.st_gid;
+    return S_ISREG(status.st_mode) && !IsReadOnly(m_kPath);
 }
 
 bool CSafeFile::Write(std::string_view text)
 {
-    while (m_iFile >= 0 && !m_bFailed && !text.empty())
-    {
-        const ssize_t written = write(m_iFile, text.data(), text.size());
-        if (written >= 0)
-            text.remove_prefix(static_cast<size_t>(written));
-        else if (errno != EINTR)
-            m_bFailed = true;
-    }
-    return m_iFile >= 0 && !m_bFailed;
+    m_bFailed = m_bFailed || m_kPrivate.File() < 0 || !WriteAll(m_kPrivate.File(), text);
+    return !m_bFailed;
 }
 
 bool CSafeFile::Write(std::span<const std::byte> bytes)
@@ -98,51 +146,67 @@ bool CSafeFile::Write(std::span<const std::byte> bytes)
 
 bool CSafeFile::Rewrite(uint64_t offset, std::span<const std::byte> bytes)
 {
-    while (m_iFile >= 0 && !m_bFailed && !bytes.empty())
-    {
-        const ssize_t written = pwrite(m_iFile, bytes.data(), bytes.size(), static_cast<off_t>(offset));
-        if (written >= 0)
-        {
-            bytes = bytes.subspan(static_cast<size_t>(written));
-            offset += static_cast<uint64_t>(written);
-        }
-        else if (errno != EINTR)
-            m_bFailed = true;
-    }
-    return m_iFile >= 0 && !m_bFailed;
+    const std::string_view text(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+    m_bFailed = m_bFailed || m_kPrivate.File() < 0 || !WriteAllAt(m_kPrivate.File(), text, offset);
+    return !m_bFailed;
 }
 
 bool CSafeFile::Commit()
 {
-    const int file = std::exchange(m_iFile, -1);
-    if (file < 0)
+    if (m_kPrivate.File() < 0)
         return false;
-    bool good = !m_bFailed && (m_uiMode == 0 || fchmod(file, m_uiMode) == 0) && Sync(file);
-    good = close(file) == 0 && good;
-    good = good && rename(m_kPrivatePath.c_str(), m_kPath.c_str()) == 0;
+    const bool good = !m_bFailed && KeepOwnership() && Sync() && Rename();
     if (good)
-        m_kPrivatePath.clear();
+        m_kPrivate.Release();
+    else if (m_eFailure == EFailure::None)
+        m_eFailure = EFailure::WriteError;
     Discard();
     return good;
 }
 
-bool CSafeFile::Sync(int file) const
+// A group that the user may not give the file to must not lend its permissions to another group either.
+bool CSafeFile::KeepOwnership()
 {
-    if (IsPrivateName(std::string_view(m_kPath).substr(FolderOf(m_kPath).size())))
+    if (m_uiMode == 0)
         return true;
+    struct stat status;
+    if (fstat(m_kPrivate.File(), &status) != 0)
+        return false;
+    unsigned mode = m_uiMode;
+    if (status.st_gid != m_uiGroup && fchown(m_kPrivate.File(), static_cast<uid_t>(-1), m_uiGroup) != 0)
+        mode = (mode & ~kGroupBits) | (mode & (mode << 3) & kGroupBits);
+    return fchmod(m_kPrivate.File(), mode) == 0;
+}
+
+// Some file systems report only at a close what they could not write. The lock, and with it the name, stays
+// with the other descriptor.
+bool CSafeFile::Sync() const
+{
+    const int file = m_kPrivate.File();
     const bool isLater = ms_bSyncsDeferred && m_uiMode == 0;
     if (isLater) // the disk begins now, so that little is left for the sync of all
         sync_file_range(file, 0, 0, SYNC_FILE_RANGE_WRITE);
-    return (isLater || fsync(file) == 0) && (!ms_kCommitGate || ms_kCommitGate(m_kPrivatePath));
+    if ((!isLater && fsync(file) != 0) || (ms_kCommitGate && !ms_kCommitGate(m_kPrivate.Path())))
+        return false;
+    const int copy = fcntl(file, F_DUPFD_CLOEXEC, 0);
+    return copy < 0 || close(copy) == 0;
+}
+
+bool CSafeFile::Rename()
+{
+    const char* const from = m_kPrivate.Path().c_str();
+    if (!m_bKeeps)
+        return rename(from, m_kPath.c_str()) == 0;
+    if (RenameToFree(from, m_kPath.c_str()))
+        return true;
+    if (errno == EEXIST)
+        m_eFailure = EFailure::Exists;
+    return false;
 }
 
 void CSafeFile::Discard()
 {
-    if (m_iFile >= 0)
-        close(std::exchange(m_iFile, -1));
-    if (!m_kPrivatePath.empty())
-        unlink(m_kPrivatePath.c_str());
-    m_kPrivatePath.clear();
+    m_kPrivate.Remove();
     m_kPath.clear();
     m_uiMode = 0;
     m_bFailed = false;

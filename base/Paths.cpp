@@ -75,6 +75,12 @@ bool FolderExists(const std::string& path)
     return fs::is_directory(NativePath(path), error);
 }
 
+bool IsLink(const std::string& path)
+{
+    std::error_code error;
+    return fs::is_symlink(NativePath(path), error);
+}
+
 bool IsFolderItself(const std::string& path)
 {
     // A separator at the end would follow a link.

@@ -31,6 +31,8 @@ std::string WithSeparator(std::string folder);
 /// Paths are UTF-8. An error of the file system counts as "no".
 bool FileExists(const std::string& path);
 bool FolderExists(const std::string& path);
+/// Whether a path is a symbolic link, wherever it leads.
+bool IsLink(const std::string& path);
 /// Whether a folder stands under a path itself, and no link that leads to one.
 bool IsFolderItself(const std::string& path);
 /// The size of a regular file in bytes; false when there is none or it cannot be examined.

@@ -1,14 +1,44 @@
+// Files under private names exist only while a program works on something else. They are hidden, nobody can
+// predict their names, and a program that is killed leaves them behind. This file decides which of them are
+// dead.
+//
+// A process number does not tell: a zombie still has one, and programs in containers see others' numbers as
+// free. So whoever writes such a file holds a lock on it (flock), which the kernel drops however the program
+// ends, and which holds across containers of one machine. A sweeper deletes only what it has locked itself.
+//
+// Between creating and locking a file, its owner can lose it to a sweeper. Then either the lock is taken or
+// the file has no name any more; the owner sees that and uses another name. A sweeper in turn makes
+// sure under its lock that the name still stands for the file that it locked, since the owner may have
+// renamed it, and only then deletes it.
+//
+// Locks are trusted on the file systems of local disks and memory only. Elsewhere (network, FUSE, unknown)
+// they may be missing, or may not reach other machines. There a file that can be locked, or that cannot have
+// a lock at all, is deleted only if its program ran on this machine, in this process namespace, and is gone,
+// or if nobody has written to it for a day.
+
 #include "PrivateNames.h"
 
 #include "Paths.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <charconv>
 #include <cstdint>
 #include <cstdio>
+#include <ctime>
+#include <iterator>
+#include <limits>
+#include <memory>
+#include <mutex>
 #include <random>
+#include <set>
 
 #include <csignal>
+#include <dirent.h>
+#include <fcntl.h>
+#include <sys/file.h>
+#include <sys/stat.h>
+#include <sys/vfs.h>
 #include <unistd.h>
 
 namespace gw {
@@ -17,17 +47,63 @@ namespace {
 
 constexpr std::string_view kPrefix = ".gaitwright-";
 constexpr size_t kDigits = 8;
-constexpr size_t kPartBytes = kDigits + 1; // with the dash or the end behind it
+constexpr size_t kPartBytes = kDigits + 1; // with the dash or the dot that follows
+constexpr time_t kOldSeconds = 24 * 60 * 60;
+constexpr size_t kQuickEntries = 1000; // read in less than a millisecond
 
-// Names of machines are short; two of one number are one machine here, which costs no more than a leftover or
-// a conversion that has to be made again.
-uint32_t MachineNumber()
+// ext2 to ext4, XFS, Btrfs, F2FS, ZFS, bcachefs, tmpfs, ramfs, overlayfs.
+constexpr uint32_t kLocalSystems[] = {0xEF53,     0x58465342, 0x9123683E, 0xF2F52010, 0x2FC12FC1,
+                                      0xCA451A4E, 0x01021994, 0x858458F6, 0x794C7630};
+
+enum class ELock : uint8_t
+{
+    Held,
+    Taken, ///< another program has it
+    None,  ///< the file system has no locks
+};
+
+ELock Lock(int file)
+{
+    if (flock(file, LOCK_EX | LOCK_NB) == 0)
+        return ELock::Held;
+    return errno == EWOULDBLOCK || errno == EINTR ? ELock::Taken : ELock::None;
+}
+
+bool IsStillNamed(int file, const std::string& path)
+{
+    struct stat open, named;
+    return fstat(file, &open) == 0 && lstat(path.c_str(), &named) == 0 && open.st_ino == named.st_ino &&
+           open.st_dev == named.st_dev;
+}
+
+bool IsOnLocalDisk(int file)
+{
+    struct statfs status;
+    return fstatfs(file, &status) == 0 &&
+           std::ranges::find(kLocalSystems, static_cast<uint32_t>(status.f_type)) != std::end(kLocalSystems);
+}
+
+uint32_t AddText(uint32_t number, const char* text)
+{
+    for (; *text; ++text)
+        number = (number ^ static_cast<unsigned char>(*text)) * 16777619u; // FNV-1a
+    return number;
+}
+
+uint32_t ReadMachineNumber()
 {
     char name[256] = {};
     gethostname(name, sizeof name - 1);
-    uint32_t number = 2166136261u; // FNV-1a
-    for (const char* c = name; *c; ++c)
-        number = (number ^ static_cast<unsigned char>(*c)) * 16777619u;
+    char processes[64] = {};
+    if (readlink("/proc/self/ns/pid", processes, sizeof processes - 1) < 0)
+        processes[0] = '\0';
+    return AddText(AddText(2166136261u, name), processes);
+}
+
+// Of the machine and the namespace of process numbers.
+uint32_t MachineNumber()
+{
+    static const uint32_t number = ReadMachineNumber();
     return number;
 }
 
@@ -42,17 +118,68 @@ bool ReadPart(std::string_view name, size_t part, uint32_t& number)
     return error == std::errc() && end == digits + kDigits;
 }
 
-bool IsGone(uint32_t program)
+struct CNameParts
 {
-    return kill(static_cast<pid_t>(program), 0) != 0 && errno == ESRCH;
+    uint32_t machine, program, random;
+};
+
+bool ReadParts(std::string_view name, CNameParts& parts)
+{
+    return IsPrivateName(name) && ReadPart(name, 0, parts.machine) && ReadPart(name, 1, parts.program) &&
+           ReadPart(name, 2, parts.random);
 }
 
-bool IsLeftover(std::string_view name)
+bool IsGone(const CNameParts& parts)
 {
-    uint32_t machine = 0;
-    uint32_t program = 0;
-    return IsPrivateName(name) && ReadPart(name, 0, machine) && ReadPart(name, 1, program) &&
-           machine == MachineNumber() && program != 0 && IsGone(program);
+    return parts.machine == MachineNumber() && parts.program != 0 &&
+           kill(static_cast<pid_t>(parts.program), 0) != 0 && errno == ESRCH;
+}
+
+bool IsDead(int file, const CNameParts& parts, const struct stat& status)
+{
+    const ELock lock = Lock(file);
+    if (lock == ELock::Taken)
+        return false;
+    return (lock == ELock::Held && IsOnLocalDisk(file)) || IsGone(parts) ||
+           time(nullptr) - status.st_mtime > kOldSeconds;
+}
+
+void RemoveIfDead(const std::string& path, const CNameParts& parts)
+{
+    struct stat status;
+    if (lstat(path.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
+        return;
+    // Over a network only a descriptor that may write can hold such a lock.
+    const int file = open(path.c_str(), O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+    if (file < 0)
+        return;
+    if (IsDead(file, parts, status) && IsStillNamed(file, path))
+        unlink(path.c_str());
+    close(file);
+}
+
+void Sweep(const std::string& folder, size_t entryLimit)
+{
+    const std::string place = folder.empty() ? "." : folder;
+    const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(place.c_str()), closedir);
+    for (size_t i = 0; directory && i < entryLimit; ++i)
+    {
+        const dirent* const entry = readdir(directory.get());
+        if (!entry)
+            return;
+        CNameParts parts;
+        if (ReadParts(entry->d_name, parts))
+            RemoveIfDead(WithSeparator(folder) + entry->d_name, parts);
+    }
+}
+
+// Whether a folder has not been swept by this process or the one that it was forked from.
+bool IsFirstSweep(const std::string& folder)
+{
+    static std::mutex mutex;
+    static std::set<std::string> swept;
+    const std::lock_guard lock(mutex);
+    return swept.insert(folder).second;
 }
 
 } // namespace
@@ -71,13 +198,22 @@ bool IsPrivateName(std::string_view name)
     return name.starts_with(kPrefix);
 }
 
+bool LockNewFile(int file)
+{
+    struct stat status;
+    return Lock(file) != ELock::Taken && fstat(file, &status) == 0 && status.st_nlink > 0;
+}
+
 void RemoveLeftovers(const std::string& folder)
 {
-    for (const std::string& name : NamesInFolder(folder))
-    {
-        if (IsLeftover(name))
-            unlink((WithSeparator(folder) + name).c_str());
-    }
+    IsFirstSweep(folder);
+    Sweep(folder, std::numeric_limits<size_t>::max());
+}
+
+void SweepOnce(const std::string& folder)
+{
+    if (IsFirstSweep(folder))
+        Sweep(folder, kQuickEntries);
 }
 
 } // namespace gw

@@ -49,7 +49,7 @@ bool CBVHExam::WriteMended(const std::string& path)
         return false;
     if (m_bRows && !CRowMender(m_kOutline, m_kPlan, m_kCells).Write(m_kText, file))
         return false;
-    return file.Commit();
+    return m_kFile.IsWhole() && file.Commit();
 }
 
 } // namespace gw

@@ -27,6 +27,8 @@ public:
     EFailure Examine(const std::string& path);
     /// Gives back the memory of the text, which is read again where it is needed.
     void Forget() { m_kFile.Forget(m_kFile.Text().size()); }
+    /// Whether the file still has all the bytes that were examined.
+    bool IsWhole() const { return m_kFile.IsWhole(); }
     /// What the text says before its rows.
     const BVHOutline& Outline() const { return m_kOutline; }
     /// Writes the text with all mendable faults gone. False when the file cannot be written; the old one

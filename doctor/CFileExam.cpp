@@ -23,6 +23,8 @@ void CFileExam::ExamineBVH(const std::string& path)
     m_spText = std::make_unique<CBVHExam>(m_kFindings);
     if (const EFailure failure = m_spText->Examine(path); failure != EFailure::None)
         return m_kFindings.AddReader({failure, 0, {}}, ESeverity::Error);
+    if (!m_spText->IsWhole())
+        return m_kFindings.AddReader({EFailure::Changed, 0, {}}, ESeverity::Error);
     m_spText->Forget();
     CMotionFile motion;
     if (motion.Load(path))

@@ -39,10 +39,10 @@ CContentHash& CContentHash::AddText(std::string_view text)
 CContentHash& CContentHash::AddFile(const std::string& path)
 {
     CMappedFile file;
-    if (file.Open(path) == EFailure::None)
-        AddPart('f', file.Text());
-    else
-        AddPart('n', {});
+    const bool isThere = file.Open(path) == EFailure::None;
+    AddPart(isThere ? 'f' : 'n', file.Text());
+    if (!file.IsWhole())
+        AddPart('c', {}); // which no whole file has
     return *this;
 }
 
@@ -58,7 +58,10 @@ std::string CContentHash::Digits() const
 std::string FileDigits(const std::string& path)
 {
     CMappedFile file;
-    return file.Open(path) == EFailure::None ? CContentHash().AddText(file.Text()).Digits() : std::string();
+    if (file.Open(path) != EFailure::None)
+        return {};
+    const std::string digits = CContentHash().AddText(file.Text()).Digits();
+    return file.IsWhole() ? digits : std::string();
 }
 
 } // namespace gw

@@ -1,6 +1,5 @@
 #include "CPrivateProfile.h"
 
-#include "CSafeFile.h"
 #include "Paths.h"
 
 #include <filesystem>
@@ -14,9 +13,7 @@ bool CPrivateProfile::Write(std::string_view text)
     const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
     if (!m_kFile && !error)
         m_kFile.emplace(folder, ".prf");
-    CSafeFile file;
-    return m_kFile && !m_kFile->Path().empty() && file.Open(m_kFile->Path()) && file.Write(text) &&
-           file.Commit();
+    return m_kFile && m_kFile->Write(text);
 }
 
 } // namespace gw

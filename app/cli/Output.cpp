@@ -1,6 +1,7 @@
 #include "Output.h"
 
 #include "CJsonWriter.h"
+#include "CSafeFile.h"
 #include "Paths.h"
 #include "Text.h"
 #include "Words.h"
@@ -20,7 +21,7 @@ bool IsDecidedOnExisting(const COptions& options)
 
 bool IsTaken(const std::string& path)
 {
-    return FileExists(path) || FolderExists(path);
+    return FileExists(path) || FolderExists(path) || IsLink(path);
 }
 
 CReport UnreadableFolder(const std::string& path)
@@ -47,8 +48,14 @@ std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& p
 {
     if (FolderExists(path))
         return ShellFailure(path, "folder", "this is a folder; name the file to write");
-    if (FileExists(path) && !options.force)
+    if (options.force)
+        return std::nullopt;
+    if (FileExists(path))
         return ShellFailure(path, "exists", "the file exists; --force replaces it");
+    if (IsLink(path))
+        return ShellFailure(path, "dangling-link",
+                            "this is a link to a file that does not exist; --force writes that file");
+    CSafeFile::KeepExisting(path);
     return std::nullopt;
 }
 

@@ -11,7 +11,7 @@ namespace gw {
 /// Whether a command line does not ask for both --force and --skip-existing. Says that they exclude each
 /// other.
 bool IsDecidedOnExisting(const COptions& options);
-/// Whether something stands under a path already.
+/// Whether there is something at a path already, a dangling link included.
 bool IsTaken(const std::string& path);
 /// The failure of a folder whose files cannot be listed.
 CReport UnreadableFolder(const std::string& path);
@@ -19,7 +19,8 @@ CReport UnreadableFolder(const std::string& path);
 bool CanListFolder(const COptions& options, const std::string& path);
 /// Whether two paths lead to one existing file.
 bool IsSameFile(const std::string& a, const std::string& b);
-/// Why a command may not write a file: it is there without --force, or it is a folder.
+/// Why a command may not write a file: it is there without --force, or it is a folder. Without --force,
+/// saving to a path that may be written also fails if a file appears there first.
 std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path);
 /// Whether a command may write a file. Says why not.
 bool MayWrite(const COptions& options, const std::string& path);

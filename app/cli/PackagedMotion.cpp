@@ -4,7 +4,6 @@
 #include "CMotionFile.h"
 #include "COrrinStream.h"
 #include "CPrivateFile.h"
-#include "CSafeFile.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
 #include "Text.h"
@@ -31,9 +30,8 @@ bool LoadBytes(const std::string& path, std::span<const std::byte> bytes, const 
     const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
     if (error)
         return SayNoTemporary("TMPDIR");
-    const CPrivateFile inner(folder, extension);
-    CSafeFile file;
-    if (inner.Path().empty() || !file.Open(inner.Path()) || !file.Write(bytes) || !file.Commit())
+    CPrivateFile inner(folder, extension);
+    if (!inner.Write(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size())))
         return SayNoTemporary(folder);
     if (motion.Load(inner.Path()))
         return true;

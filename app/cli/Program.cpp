@@ -2,11 +2,16 @@
 
 #include "Arguments.h"
 #include "Commands.h"
+#include "LiveNames.h"
 #include "Words.h"
 
+#include <cerrno>
 #include <csignal>
 #include <cstdio>
 #include <new>
+
+#include <fcntl.h>
+#include <unistd.h>
 
 namespace gw {
 
@@ -27,10 +32,23 @@ EExit RunArguments(int argc, char** argv)
     }
 }
 
+// A stream that whoever started the program has closed leaves its number to the next file that is opened,
+// which would then be a result with messages in it.
+void OpenStandardStreams()
+{
+    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
+    {
+        if (fcntl(stream, F_GETFD) < 0 && errno == EBADF)
+            open("/dev/null", O_RDWR); // takes the lowest number, which is this one
+    }
+}
+
 } // namespace
 
 int RunProgram(int argc, char** argv)
 {
+    OpenStandardStreams();
+    RemovePrivateFilesOnSignals();
 #ifdef SIGXFSZ
     // A file size limit answers the write with an error, as a full disk does; by itself it would end the
     // program and leave half a file.

@@ -162,14 +162,18 @@ bool ReadPicture(const std::string& path, CPixelBuffer& pixels, CLinkedPictures*
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
-    return DecodeOne(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, memory, pixels);
+    const bool isDecoded =
+        DecodeOne(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, memory, pixels);
+    return isDecoded && file.IsWhole();
 }
 
 bool ReadFrames(const std::string& path, const CFrameTaker& take, CLinkedPictures* memory)
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
-    return Decode(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, true, memory, take);
+    const bool isDecoded =
+        Decode(file.Bytes(), isThere ? FormatOf(path, file.Text()) : nullptr, true, memory, take);
+    return isDecoded && file.IsWhole();
 }
 
 bool DecodeJPEG(std::span<const uint8_t> file, CPixelBuffer& pixels)

@@ -93,6 +93,11 @@ bool CMotionFile::Load(const std::string& path)
         const auto stream = row->make();
         const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
         m_kRecord = stream->m_kRecord;
+        if (!stream->IsSourceWhole())
+        {
+            m_kRecord.Clear(); // of what the missing bytes looked like
+            return m_kRecord.Fail(EFailure::Changed);
+        }
         if (!loaded)
             return false;
         JudgeRestPose(*stream->motionRoot, m_kRecord);
@@ -156,10 +161,12 @@ bool CMotionFile::ReadLines(const std::string& path)
 bool CMotionFile::WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append)
 {
     CSafeFile file;
-    if (path.empty() || !file.Open(path))
+    if (path.empty())
         return m_kRecord.Fail(EFailure::WriteError);
+    if (!file.Open(path))
+        return m_kRecord.Fail(file.Failure());
     const CByteSink sink = [&](std::span<const std::byte> bytes) { return file.Write(bytes); };
-    return WriteLines(sink, append) && (file.Commit() || m_kRecord.Fail(EFailure::WriteError));
+    return WriteLines(sink, append) && (file.Commit() || m_kRecord.Fail(file.Failure()));
 }
 
 bool CMotionFile::WriteLines(const CByteSink& sink, const std::function<bool(CLineWriter&)>& append)

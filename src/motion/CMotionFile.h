@@ -57,6 +57,9 @@ protected:
     /// Hands such lines to a sink. False where it refuses any or `append` gives up.
     bool WriteLines(const CByteSink& sink, const std::function<bool(CLineWriter&)>& append);
 
+    /// Whether the source still had all its bytes when Load was done with it.
+    virtual bool IsSourceWhole() const { return lines.IsWhole(); }
+
     CTextLines lines; ///< the text being read
     CFailureRecord m_kRecord;
 

@@ -34,6 +34,8 @@ public:
     size_t LineNumber() const { return m_kNow.m_uiLine; }
     size_t BytesLeft() const { return m_kFile.Text().size() - m_kNow.m_uiOffset; }
     size_t ByteCount() const { return m_kFile.Text().size(); }
+    /// See CMappedFile.
+    bool IsWhole() const { return m_kFile.IsWhole(); }
     /// Gives back the memory of what was read so far, when that is worth a call of the system.
     void ForgetRead();
 

@@ -25,6 +25,9 @@ public:
     /// Gives a node the bone mesh of its segment.
     virtual void AddBoneShape(const TKCHFile& file, const TKCHSegment& segment, CNode& node);
 
+protected:
+    bool IsSourceWhole() const override { return m_kFile.IsWhole(); }
+
 private:
     // The line of the source that asks, as a default argument tells it. Not every compiler that builds this
     // has the library's class for it.

@@ -76,6 +76,11 @@ void CRawData::SetData(CMappedFile&& file)
     m_pbyData = {m_spkFile, m_spkFile->Bytes().data()};
 }
 
+bool CRawData::IsWhole() const
+{
+    return !m_spkFile || m_spkFile->IsWhole();
+}
+
 bool CRawData::WriteData(const CByteSink& sink) const
 {
     constexpr size_t kPieceBytes = size_t{8} << 20;
@@ -88,7 +93,7 @@ bool CRawData::WriteData(const CByteSink& sink) const
         if (m_spkFile)
             m_spkFile->Forget(done);
     }
-    return true;
+    return IsWhole();
 }
 
 uint64_t CRawData::GetMemoryUsed() const

@@ -64,8 +64,10 @@ public:
     /// Refers to the bytes of a file of at most 4 GiB without copying them.
     void SetData(CMappedFile&& file);
     std::span<const std::byte> Data() const { return {m_pbyData.get(), m_uiDataSize}; }
+    /// Whether a file that the bytes are in still has them all; see CMappedFile.
+    bool IsWhole() const;
     /// Passes the bytes on in pieces. Memory that a piece of a mapped file took is freed after it. False as
-    /// soon as the sink returns false.
+    /// soon as the sink returns false, and if the file was not whole.
     bool WriteData(const CByteSink& sink) const;
 
 private:

@@ -161,7 +161,11 @@ bool COrrinStream::LoadFile(const std::string& path, bool thumbnailOnly)
         LoadBuffer(bytes, kHeader.size());
         m_pkFile = nullptr;
     }
-    return true;
+    if (file.IsWhole())
+        return true;
+    RemoveAllRoots();
+    m_kRecord.Clear(); // of what the missing bytes looked like
+    return m_kRecord.Fail(EFailure::Changed);
 }
 
 bool COrrinStream::LoadThumbnailOnly(std::span<const std::byte> bytes, size_t position)
@@ -424,15 +428,15 @@ bool COrrinStream::SaveFile(const std::string& path)
     if (!file.Open(path))
     {
         ClearSaveList();
-        return m_kRecord.Fail(EFailure::WriteError);
+        return m_kRecord.Fail(file.Failure());
     }
     CFieldWriter writer([&](std::span<const std::byte> bytes) { return file.Write(bytes); },
                         [this](const CObject* object) { return LinkID(object); });
     writer.WriteBytes(FileHeader());
     WriteObjects(writer);
-    if (!writer.Flush() || !file.Commit())
+    if (!writer.Flush())
         return m_kRecord.Fail(EFailure::WriteError);
-    return true;
+    return file.Commit() || m_kRecord.Fail(file.Failure());
 }
 
 } // namespace gw

@@ -87,7 +87,7 @@ uint32_t FormatCode(const std::string& path)
 bool CPackageFile::Keep(bool written)
 {
     if (!written && m_eFailure == EFailure::None)
-        m_eFailure = EFailure::WriteError;
+        m_eFailure = m_kFile.Failure() == EFailure::None ? EFailure::WriteError : m_kFile.Failure();
     return m_eFailure == EFailure::None;
 }
 

@@ -31,9 +31,12 @@ bool PackageMotion(const std::string& sourcePath, const std::string& targetPath,
         return record.Fail(EFailure::NotFound, 0, sourcePath);
     CPackageFile package;
     const CByteSink sink = [&](std::span<const std::byte> bytes) { return package.Write(bytes); };
-    if (!package.Open(targetPath, {FormatCode(sourcePath), third, fourth}) || !motion->WriteData(sink) ||
-        !package.Commit())
-        record.Fail(package.Failure(), 0, targetPath);
+    if (package.Open(targetPath, {FormatCode(sourcePath), third, fourth}) && motion->WriteData(sink) &&
+        package.Commit())
+        return true;
+    if (!motion->IsWhole())
+        return record.Fail(EFailure::Changed, 0, sourcePath);
+    record.Fail(package.Failure(), 0, targetPath);
     return true;
 }
 

@@ -7,11 +7,14 @@
 
 #include <algorithm>
 #include <csignal>
+#include <fcntl.h>
 #include <filesystem>
 #include <gtest/gtest.h>
 #include <numeric>
+#include <sys/mman.h>
 #include <sys/resource.h>
 #include <sys/stat.h>
+#include <sys/wait.h>
 
 namespace gw {
 
@@ -19,11 +22,16 @@ namespace {
 
 namespace fs = std::filesystem;
 
-unsigned ModeOf(const std::string& path)
+struct stat StatusOf(const std::string& path)
 {
     struct stat status = {};
     EXPECT_EQ(stat(path.c_str(), &status), 0) << path;
-    return status.st_mode & 07777;
+    return status;
+}
+
+unsigned ModeOf(const std::string& path)
+{
+    return StatusOf(path).st_mode & 07777;
 }
 
 bool Save(const std::string& path, std::string_view text)
@@ -193,7 +201,7 @@ TEST(CMappedFile, MapsRegularFilesOnly)
 
 TEST(CMappedFile, KeepsItsBytesWhenMovedAndAfterForgetting)
 {
-    for (const size_t size : {size_t{5000}, size_t{16384}, size_t{16385}, size_t{100000}})
+    for (const size_t size : {size_t{5000}, size_t{1} << 20, (size_t{1} << 20) + 1, size_t{2000000}})
     {
         SCOPED_TRACE(size);
         const CTempFolder folder;
@@ -216,17 +224,61 @@ TEST(CMappedFile, KeepsItsBytesWhenMovedAndAfterForgetting)
     }
 }
 
-TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)
+// A mapping that loses its pages gives zeros and says so; it does not end the program.
+TEST(CMappedFile, AFileThatIsCutWhileItIsReadIsNotWhole)
+{
+    constexpr size_t size = (size_t{1} << 21) + 1000;
+    for (const size_t left : {size_t{0}, size_t{1} << 20, (size_t{1} << 20) + 100, size - 1, size})
+    {
+        SCOPED_TRACE(left);
+        const CTempFolder folder;
+        WriteBytes(folder.Path("a"), std::string(size, 'x'));
+        CMappedFile other, file;
+        ASSERT_EQ(other.Open(folder.Path("a")), EFailure::None);
+        other.Close();
+        ASSERT_EQ(file.Open(folder.Path("a")), EFailure::None);
+        EXPECT_TRUE(file.IsWhole());
+        fs::resize_file(folder.Path("a"), left);
+        for (int round = 0; round < 2; ++round)
+        {
+            EXPECT_EQ(std::ranges::count(file.Text(), 'x'), static_cast<ptrdiff_t>(left));
+            EXPECT_EQ(file.IsWhole(), left == size);
+            file.Forget(size / 2);
+        }
+        CMappedFile moved(std::move(file));
+        EXPECT_EQ(moved.IsWhole(), left == size);
+        moved.Close();
+        EXPECT_TRUE(moved.IsWhole());
+    }
+}
+
+TEST(CMappedFile, AnotherBusErrorStillEndsTheProgram)
+{
+    const CTempFolder folder;
+    WriteBytes(folder.Path("a"), std::string(size_t{1} << 21, 'x'));
+    CMappedFile file;
+    ASSERT_EQ(file.Open(folder.Path("a")), EFailure::None);
+    const int foreign = open(folder.Path("a").c_str(), O_RDONLY);
+    const auto* bytes =
+        static_cast<const volatile char*>(mmap(nullptr, 4096, PROT_READ, MAP_SHARED, foreign, 0));
+    fs::resize_file(folder.Path("a"), 0);
+    EXPECT_DEATH((void)bytes[0], "");
+    close(foreign);
+}
+
+TEST(CSafeFile, ReplacesInOneStepAndKeepsGroupAndPermissions)
 {
     const CTempFolder folder;
     const std::string path = folder.Path("a.htr");
     WriteBytes(path, "old");
-    fs::permissions(path, fs::perms(0660)); // which the user's mask would cut
+    [[maybe_unused]] const int foreign = chown(path.c_str(), static_cast<uid_t>(-1), 4321); // as root only
+    const gid_t group = StatusOf(path).st_gid;
+    fs::permissions(path, fs::perms(06660)); // which the user's mask would cut
     CSafeFile file;
     const mode_t mask = umask(022);
     ASSERT_TRUE(file.Open(path));
     umask(mask);
-    EXPECT_EQ(ModeOf(file.PrivatePath()) & 07, 0u); // not laid open meanwhile
+    EXPECT_EQ(ModeOf(file.PrivatePath()), 0600u); // not laid open meanwhile
     EXPECT_TRUE(file.Write("new "));
     const std::byte bytes[] = {std::byte{'0'}, std::byte{0}};
     EXPECT_TRUE(file.Write(bytes));
@@ -235,7 +287,8 @@ TEST(CSafeFile, ReplacesInOneStepAndKeepsTheMode)
     EXPECT_TRUE(file.Commit());
     EXPECT_FALSE(file.Commit());
     EXPECT_EQ(ReadBytes(path), std::string("new 0\0", 6));
-    EXPECT_EQ(ModeOf(path), 0660u);
+    EXPECT_EQ(ModeOf(path), 0660u) << "without set-id bits";
+    EXPECT_EQ(StatusOf(path).st_gid, group);
     EXPECT_EQ(EntryCount(folder), 1u);
 }
 
@@ -297,6 +350,44 @@ TEST(CSafeFile, SymbolicLinksAreFollowed)
         EXPECT_TRUE(fs::is_symlink(folder.Path(link))) << link;
 }
 
+TEST(CSafeFile, WhatIsToBeKeptIsNotReplacedThoughItAppearedMeanwhile)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("a");
+    const struct
+    {
+        const char* what;
+        bool isKept, isThere, appears;
+        EFailure failure;
+        const char* text;
+    } rows[] = {
+        {"free",            true,  false, false, EFailure::None,   "new"  },
+        {"there before",    true,  true,  false, EFailure::Exists, "other"},
+        {"there meanwhile", true,  false, true,  EFailure::Exists, "other"},
+        {"may be replaced", false, false, true,  EFailure::None,   "new"  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        fs::remove(path);
+        if (row.isKept)
+            CSafeFile::KeepExisting(path);
+        if (row.isThere)
+            WriteBytes(path, "other");
+        CSafeFile file;
+        const bool isOpen = file.Open(path) && file.Write("new");
+        if (row.appears)
+            WriteBytes(path, "other");
+        EXPECT_EQ(isOpen && file.Commit(), row.failure == EFailure::None);
+        EXPECT_EQ(file.Failure(), row.failure);
+        EXPECT_EQ(ReadBytes(path), row.text);
+        EXPECT_EQ(EntryCount(folder), 1u);
+    }
+    fs::create_symlink("nowhere", folder.Path("dangling"));
+    CSafeFile::KeepExisting(folder.Path("dangling"));
+    EXPECT_FALSE(Save(folder.Path("dangling"), "new"));
+}
+
 TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
 {
     const CTempFolder folder;
@@ -336,15 +427,18 @@ TEST(CSafeFile, PrivateFilesLieBesideAndDiffer)
 {
     const CTempFolder folder;
     {
-        const CPrivateFile first(folder.Path("walk.htr"), ".htr");
-        const CPrivateFile second(folder.Path("walk.htr"), ".htr");
+        CPrivateFile first(folder.Path("walk.htr"), ".htr");
+        CPrivateFile second(folder.Path("walk.htr"), ".htr");
         EXPECT_NE(first.Path(), second.Path());
-        for (const std::string& path : {first.Path(), second.Path()})
+        for (CPrivateFile* file : {&first, &second})
         {
+            const std::string& path = file->Path();
             EXPECT_EQ(SplitPath(path).folder, folder.Path());
             EXPECT_TRUE(HasExtension(path, ".htr"));
             EXPECT_EQ(ReadBytes(path), "");
             EXPECT_EQ(ModeOf(path), 0600u) << "for nobody else's eyes";
+            EXPECT_TRUE(file->Write("long text") && file->Write("text"));
+            EXPECT_EQ(ReadBytes(path), "text");
         }
         EXPECT_TRUE(FilesInFolder(folder.Path(), ".htr").empty()) << "nobody takes one for a motion";
         EXPECT_EQ(CPrivateFile(folder.Path("none/walk.htr"), ".htr").Path(), "");
@@ -352,35 +446,71 @@ TEST(CSafeFile, PrivateFilesLieBesideAndDiffer)
     EXPECT_EQ(EntryCount(folder), 0u);
 }
 
-TEST(PrivateNames, OnlyWhatADeadProgramLeftIsRemoved)
+// Also if the name says that its program lives, or ran elsewhere: only the lock counts.
+TEST(PrivateNames, ASaveRemovesWhatNoLivingProgramHolds)
 {
     const CTempFolder folder;
-    const std::string own = PrivateName(folder.Path(), ".tmp");
-    std::string left = own;
-    const pid_t child = fork();
-    if (child == 0)
-        _exit(0);
-    waitpid(child, nullptr, 0);
-    char number[16];
-    std::snprintf(number, sizeof number, "-%08x-", static_cast<unsigned>(child));
-    left.replace(left.size() - 22, 10, number);
-    std::string foreign = left;
-    foreign[foreign.size() - 23] = foreign[foreign.size() - 23] == '0' ? '1' : '0'; // of another machine
-    for (const std::string& path :
-         {own, left, foreign, folder.Path(".gaitwright-notes"), folder.Path("a.tmp")})
+    CPrivateFile live(folder.Path("walk.htr"), ".htr");
+    std::string foreign = PrivateName(folder.Path(), ".tmp");
+    foreign.replace(foreign.size() - 30, 8, "12345678");
+    const std::string dead[] = {PrivateName(folder.Path(), ".tmp"), foreign};
+    const std::string kept[] = {live.Path(), folder.Path(".gaitwright-notes"), folder.Path("a.tmp")};
+    for (const std::string& path : dead)
         WriteBytes(path, "x");
+    for (const std::string& path : kept)
+        WriteBytes(path, "x");
+    const std::string link = PrivateName(folder.Path(), ".tmp");
+    fs::create_symlink("a.tmp", link);
     RemoveLeftovers(folder.Path());
+    for (const std::string& path : dead)
+        EXPECT_FALSE(FileExists(path)) << path;
+    for (const std::string& path : kept)
+        EXPECT_TRUE(FileExists(path)) << path;
+    EXPECT_TRUE(IsLink(link));
+
+    CreateFolder(folder.Path("other"));
+    const std::string left = PrivateName(folder.Path("other/"), ".tmp");
+    WriteBytes(left, "x");
+    EXPECT_TRUE(Save(folder.Path("other/walk.htr"), "new"));
     EXPECT_FALSE(FileExists(left));
-    EXPECT_EQ(EntryCount(folder), 4u);
+}
+
+// Programs that create, sweep and rename in one folder at once, as shards do.
+TEST(PrivateNames, SweepersTakeNothingFromThoseWhoWrite)
+{
+    const CTempFolder folder;
+    std::vector<pid_t> programs;
+    for (int program = 0; program < 8; ++program)
+    {
+        programs.push_back(fork());
+        if (programs.back() != 0)
+            continue;
+        bool good = true;
+        for (int i = 0; i < 200 && good; ++i)
+        {
+            CSafeFile file;
+            good = file.Open(folder.Path(std::to_string(program))) && file.Write("x");
+            RemoveLeftovers(folder.Path());
+            good = good && file.Commit();
+        }
+        _exit(good ? 0 : 1);
+    }
+    for (const pid_t program : programs)
+    {
+        int status = 0;
+        waitpid(program, &status, 0);
+        EXPECT_EQ(status, 0);
+    }
+    EXPECT_EQ(EntryCount(folder), programs.size());
 }
 
 TEST(CSafeFile, AGateHoldsBackWhatWouldTakeItsName)
 {
     const CTempFolder folder;
-    const CPrivateFile intermediate(folder.Path("walk.Kinetra"), ".htr");
+    CPrivateFile intermediate(folder.Path("walk.Kinetra"), ".htr");
     int asked = 0;
     CSafeFile::SetCommitGate([&](const std::string&) { return ++asked > 1; });
-    EXPECT_TRUE(Save(intermediate.Path(), "new"));
+    EXPECT_TRUE(intermediate.Write("new"));
     EXPECT_EQ(asked, 0);
     EXPECT_FALSE(Save(folder.Path("walk.Kinetra"), "new"));
     EXPECT_EQ(EntryCount(folder), 1u);

@@ -1,7 +1,9 @@
 """Motion files that are broken, strange or enormous: a sentence with the place, and nothing else."""
 import json
+import os
+import subprocess
 
-from harness import DONE, FAILED, CliTest, main
+from harness import ASSETS, DONE, FAILED, PROGRAM, SECONDS, CliTest, main
 from made import BVH, CHA, bvh, cha, chb, htr, profile
 
 ROW = "1 90 0 0 0 0 90 0 0"
@@ -159,6 +161,30 @@ class Files(CliTest):
             result = self.run_program("info", name)
             self.assertEqual(result.code, FAILED)
             self.assert_words(result, [name, "folder or a device"])
+
+    def test_a_closed_stream_leaves_its_number_to_no_result(self):
+        self.write("take.bvh", BVH)
+        expected = self.with_assets("convert", "take.bvh", "-o", "out.htr", "--force", "--profile", "small.prf")
+        good = self.read("out.htr")
+        self.assertEqual(expected.code, DONE)
+        for closed in ((1,), (2,), (0, 1, 2)):
+            with self.subTest(closed):
+                command = [PROGRAM, "convert", "take.bvh", "-o", "out.htr", "--force", "--profile", "small.prf",
+                           "--data-dir", str(ASSETS)]
+                done = subprocess.run(command, cwd=self.folder, env=self.environment, timeout=SECONDS,
+                                      preexec_fn=lambda: [os.close(stream) for stream in closed])
+                self.assertEqual((done.returncode, self.read("out.htr")), (DONE, good))
+
+    def test_a_link_to_nothing_is_written_through_only_when_forced(self):
+        self.write("take.bvh", BVH)
+        (self.folder / "link.htr").symlink_to("made.htr")
+        command = ["convert", "take.bvh", "-o", "link.htr", "--profile", "small.prf"]
+        result = self.with_assets(*command)
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["link.htr", "link to a file that does not exist", "--force"])
+        self.assertFalse((self.folder / "made.htr").exists())
+        self.succeed(*command, "--force")
+        self.assertTrue((self.folder / "made.htr").exists() and (self.folder / "link.htr").is_symlink())
 
     def test_a_result_that_cannot_be_shown_is_a_failure(self):
         self.write("take.bvh", BVH)

@@ -1,6 +1,7 @@
 // Loaded before a program, this makes one call of one kind fail: the FAULT_NUMBERth that the program and its
 // worker processes make of FAULT_OPERATION, from the start of its main function on. How many they made is
-// written to FAULT_REPORT when it ends. Calls that the system's library makes for itself are not met.
+// written to FAULT_REPORT when it ends. Calls that the system's library makes for itself are not met. The
+// calls that FAULT_MISSING names (flock, link, renameat2) always fail, as on a file system that lacks them.
 
 #include <atomic>
 #include <cerrno>
@@ -14,6 +15,7 @@
 
 #include <dlfcn.h>
 #include <fcntl.h>
+#include <sys/file.h>
 #include <sys/mman.h>
 #include <sys/syscall.h>
 #include <unistd.h>
@@ -53,6 +55,12 @@ Count* g_pkCalls = nullptr; // of the program and the processes that work for it
 bool IsDue(EOperation operation)
 {
     return operation == g_eOperation && ++*g_pkCalls == g_iNumber;
+}
+
+bool IsMissing(const char* call)
+{
+    const char* const missing = std::getenv("FAULT_MISSING");
+    return missing && std::strstr(missing, call);
 }
 
 int Refuse(int error)
@@ -167,6 +175,25 @@ ssize_t pwrite64(int file, const void* bytes, size_t count, off_t offset) __attr
 int rename(const char* from, const char* to)
 {
     return IsDue(EOperation::Rename) ? Refuse(EIO) : static_cast<int>(syscall(SYS_rename, from, to));
+}
+
+int renameat2(int fromFolder, const char* from, int toFolder, const char* to, unsigned flags)
+{
+    if (IsMissing("renameat2"))
+        return Refuse(EINVAL);
+    return IsDue(EOperation::Rename)
+               ? Refuse(EIO)
+               : static_cast<int>(syscall(SYS_renameat2, fromFolder, from, toFolder, to, flags));
+}
+
+int link(const char* from, const char* to)
+{
+    return IsMissing("link") ? Refuse(EPERM) : static_cast<int>(syscall(SYS_link, from, to));
+}
+
+int flock(int file, int operation)
+{
+    return IsMissing("flock") ? Refuse(ENOLCK) : static_cast<int>(syscall(SYS_flock, file, operation));
 }
 
 int fsync(int file)

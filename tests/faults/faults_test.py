@@ -37,8 +37,27 @@ for name in ("base.htr", "KsBone.bsm", "PoserBVH.prf", "CMUOriginalFingers.prf")
 SMALL = profile("Small", [("Hips", "LowerTorso")])
 
 
+def preload():
+    if not SANITIZED:
+        return SHIM
+    runtime = subprocess.run(["g++", "-print-file-name=libasan.so"], capture_output=True, check=True)
+    return runtime.stdout.decode().strip() + " " + SHIM
+
+
 def small_motion(number):
     return BVH.replace("2 90 0", "%d 90 0" % (number + 3))
+
+
+def large_motion(count):
+    rows = "".join("%d 90 0 0 0 0 90 0 0\n" % (row % 100) for row in range(count))
+    return BVH.replace("Frames: 3", "Frames: %d" % (count + 3)) + rows
+
+
+def is_mapped(running, name):
+    try:
+        return name.encode() in Path("/proc/%d/maps" % running.pid).read_bytes()
+    except OSError:
+        return False  # it is just beginning or ending
 
 
 def picture_scene():
@@ -129,7 +148,7 @@ class Faults(CliTest):
         """Exit code, standard error and the calls that there were of the operation."""
         report = str(self.folder) + "-calls"
         self.addCleanup(Path(report).unlink, missing_ok=True)
-        environment = dict(self.environment, LD_PRELOAD=self.preload(), FAULT_OPERATION=operation,
+        environment = dict(self.environment, LD_PRELOAD=preload(), FAULT_OPERATION=operation,
                            FAULT_NUMBER=str(number), FAULT_REPORT=report)
 
         def limit():
@@ -139,12 +158,6 @@ class Faults(CliTest):
                               capture_output=True, preexec_fn=limit if file_limit is not None else None)
         calls = int(Path(report).read_text()) if Path(report).exists() and file_limit is None else 0
         return done.returncode, done.stderr.decode(), calls
-
-    def preload(self):
-        if not SANITIZED:
-            return SHIM
-        runtime = subprocess.run(["g++", "-print-file-name=libasan.so"], capture_output=True, check=True)
-        return runtime.stdout.decode().strip() + " " + SHIM
 
     def content(self, case):
         return {name: self.read(name) for name in case.files}
@@ -221,6 +234,92 @@ class Faults(CliTest):
         self.assertEqual(result.code, FAILED)
         self.assert_words(result, ["standard output"])
         self.assertEqual(self.files(), ["a.bvh", "a.htr", "small.prf"])
+
+
+class Stopped(CliTest):
+    """What other programs do while a conversion reads or writes."""
+
+    def setUp(self):
+        super().setUp()
+        self.write("small.prf", SMALL)
+        self.write("small.bvh", BVH)
+        self.write("large.bvh", large_motion(40_000))
+
+    def convert(self, source, missing=""):
+        return self.start([PROGRAM, "convert", source, "-o", "out.Kinetra", "--profile", "small.prf", "--data-dir",
+                           str(DATA)], missing)
+
+    def start(self, command, missing=""):
+        environment = dict(self.environment, FAULT_MISSING=missing, TMPDIR=str(self.folder))
+        if missing:
+            environment["LD_PRELOAD"] = preload()
+        return subprocess.Popen(command, cwd=self.folder, env=environment, stdout=subprocess.PIPE,
+                                stderr=subprocess.STDOUT)
+
+    def private_files(self):
+        return [path for path in self.folder.iterdir() if path.name.startswith(".gaitwright-")]
+
+    def stop_when(self, running, condition):
+        end = time.monotonic() + SECONDS
+        while not condition() and running.poll() is None and time.monotonic() < end:
+            pass
+        running.send_signal(signal.SIGSTOP)
+        self.assertTrue(condition(), "it was too fast or too slow")
+
+    def end(self, running, number=signal.SIGCONT):
+        running.send_signal(number)
+        running.send_signal(signal.SIGCONT)
+        words, _ = running.communicate(timeout=SECONDS)
+        return running.returncode, words.decode()
+
+    def test_a_single_conversion_that_is_ended_leaves_nothing(self):
+        for number in (signal.SIGINT, signal.SIGTERM, signal.SIGHUP, signal.SIGKILL):
+            with self.subTest(number):
+                running = self.convert("large.bvh")
+                self.stop_when(running, self.private_files)
+                code, _ = self.end(running, number)
+                self.assertEqual(code, -number)
+                self.assertEqual(len(self.private_files()), number == signal.SIGKILL)
+        self.assertEqual(self.end(self.convert("small.bvh"))[0], DONE)
+        self.assertEqual(self.private_files(), [], "the next save removes what was killed")
+
+    def test_a_file_that_appears_meanwhile_stays(self):
+        for missing in ("", "renameat2", "renameat2 link"):
+            with self.subTest(missing):
+                running = self.convert("large.bvh", missing)
+                self.stop_when(running, self.private_files)
+                self.write("out.Kinetra", OLD)
+                code, words = self.end(running)
+                self.assertEqual(code, FAILED)
+                self.assertIn("--force", words)
+                self.assertEqual(self.read("out.Kinetra"), OLD)
+                (self.folder / "out.Kinetra").unlink()
+                self.assertEqual(self.end(self.convert("small.bvh", missing))[0], DONE)
+                self.assertGreater(len(self.read("out.Kinetra")), len(OLD))
+                (self.folder / "out.Kinetra").unlink()
+                self.assertEqual(self.files(), ["large.bvh", "small.bvh", "small.prf"])
+
+    def test_a_source_that_is_cut_while_it_is_read_is_a_failure(self):
+        large = large_motion(400_000)  # long enough to be met while it is read
+        for command in (["convert", "large.bvh", "-o", "out.htr", "--profile", "small.prf"], ["info", "large.bvh"],
+                        ["doctor", "large.bvh"]):
+            with self.subTest(command[0]):
+                self.write("large.bvh", large)
+                running = self.start([PROGRAM, *command, "--data-dir", str(DATA)])
+                self.stop_when(running, lambda: is_mapped(running, "large.bvh"))
+                os.truncate(self.folder / "large.bvh", 5000)
+                code, words = self.end(running)
+                self.assertEqual(code, FAILED, words)
+                self.assertIn("truncated", words)
+                self.assertEqual(self.files(), ["large.bvh", "small.bvh", "small.prf"])
+
+    def test_without_locks_only_old_leftovers_are_removed(self):
+        for days, is_kept in ((0, True), (2, False)):
+            left = self.write(".gaitwright-12345678-00000001-00000002.tmp", "x")
+            os.utime(left, (time.time() - days * 86400,) * 2)
+            self.assertEqual(self.end(self.convert("small.bvh", "flock"))[0], DONE)
+            self.assertEqual(left.exists(), is_kept)
+            (self.folder / "out.Kinetra").unlink()
 
 
 class Killed(CliTest):

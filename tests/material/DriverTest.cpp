@@ -121,7 +121,7 @@ public:
         close(m_iSaved);
         m_bPipe ? pclose(m_pkPipe) : std::fclose(m_pkPipe);
         // What was read ahead belongs to the input that is gone.
-        std::freopen("/dev/null", "rb", stdin);
+        EXPECT_NE(std::freopen("/dev/null", "rb", stdin), nullptr);
     }
 
 private:

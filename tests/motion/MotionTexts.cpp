@@ -19,6 +19,7 @@ const struct
 } kReasons[] = {
     {EFailure::NotFound,       "NotFound"      },
     {EFailure::NotRegular,     "NotRegular"    },
+    {EFailure::Changed,        "Changed"       },
     {EFailure::WriteError,     "WriteError"    },
     {EFailure::UnknownFormat,  "UnknownFormat" },
     {EFailure::MissingSection, "MissingSection"},
