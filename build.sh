@@ -39,10 +39,12 @@ need() {
     "${missing[@]}" >/dev/null
 }
 
-# build PRESET: configures once and builds everything.
+# build PRESET [TARGETS...]: configures once and builds the targets, by default everything.
 build() {
-  [ -f "build/$1/build.ninja" ] || cmake --preset "$1" >/dev/null
-  cmake --build --preset "$1"
+  local preset=$1
+  shift
+  [ -f "build/$preset/build.ninja" ] || cmake --preset "$preset" >/dev/null
+  cmake --build --preset "$preset" ${1:+--target "$@"}
 }
 
 # run_tests PRESET: real motions lie beside the project on some machines; the tests use them where they are.
@@ -106,7 +108,7 @@ build)
   ;;
 demo)
   prepare
-  build release
+  build release shell
   demo
   ;;
 test)

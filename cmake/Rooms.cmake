@@ -8,7 +8,7 @@ endif()
 
 # What makes a fault in a release harder to exploit. In the rooms of the inner loops, checks of containers and of every
 # function's stack would cost 6 % of a conversion; there only functions with buffers are checked.
-set(GAITWRIGHT_INNER_ROOMS gw_math gw_base gw_scene gw_motion)
+set(GAITWRIGHT_INNER_ROOMS gw_math gw_base gw_scene gw_motion gw_retarget)
 set(GAITWRIGHT_HARDENING -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
 set(GAITWRIGHT_HARDENING_INNER ${GAITWRIGHT_HARDENING} -fstack-protector)
 set(GAITWRIGHT_HARDENING_OUTER ${GAITWRIGHT_HARDENING} -fstack-protector-strong -D_GLIBCXX_ASSERTIONS)
@@ -67,5 +67,7 @@ function(gw_tests name)
   add_executable(${name} ${sources})
   target_link_libraries(${name} PRIVATE ${ARGN} gw_test_support GTest::gmock GTest::gtest_main)
   gw_compile_options(${name})
+  # Tests are compiled once for each run, and the libraries that they test are optimized as usual.
+  target_compile_options(${name} PRIVATE $<$<CONFIG:Release>:-O1>)
   gtest_discover_tests(${name} DISCOVERY_TIMEOUT 60 PROPERTIES TIMEOUT 300)
 endfunction()

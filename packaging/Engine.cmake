@@ -3,7 +3,7 @@
 include(CMakePackageConfigHelpers)
 
 set(configs ${CMAKE_INSTALL_LIBDIR}/cmake/Gaitwright)
-gw_rooms_seen(rooms gw_app gw_report)
+gw_rooms_seen(rooms gw_app gw_page gw_drivers)
 foreach(room IN LISTS rooms)
   string(REGEX REPLACE "^gw_" "" name ${room})
   set_target_properties(${room} PROPERTIES EXPORT_NAME ${name})

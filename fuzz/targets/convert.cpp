@@ -1,6 +1,6 @@
 // The command as its users run it: any file becomes a result, or a clear failure and no file.
 
-#include "Commands.h"
+#include "CommandTable.h"
 #include "FuzzTarget.h"
 #include "Paths.h"
 

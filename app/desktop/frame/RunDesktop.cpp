@@ -1,6 +1,6 @@
 #include "RunDesktop.h"
 
-#include "Arguments.h"
+#include "DesktopArguments.h"
 #include "CFilePlatform.h"
 #include "CGaitConvertFrame.h"
 #include "CInstanceCounter.h"

@@ -1,0 +1,119 @@
+#include "AlignReport.h"
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "Paths.h"
+#include "ProfileChoice.h"
+#include "ProfileFit.h"
+#include "ReportJson.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+struct NeedWords
+{
+    EAlignNeed need;
+    const char* code;
+    const char* one; ///< "1 joint ..."
+    const char* many;
+};
+
+constexpr NeedWords kNeeds[] = {
+    {EAlignNeed::RestPose,         "rest-pose",      "bone beside its axis at rest",   "bones beside their axes at rest"},
+    {EAlignNeed::UpAxis,           "up-axis",        "up axis that is not Y",          "up axes that are not Y"         },
+    {EAlignNeed::BoneFrames,       "bone-frame",     "bone frame turned by its slant",
+     "bone frames turned by their slant"                                                                                },
+    {EAlignNeed::DoubledPositions, "doubled-offset", "bone told twice",                "bones told twice"               },
+};
+
+const char* CodeOf(EAlignNeed need)
+{
+    return std::ranges::find(kNeeds, need, &NeedWords::need)->code;
+}
+
+// "4 bones beside their axes at rest, 2 bone frames turned by their slant"
+std::string MendedText(const AlignReport& report)
+{
+    std::string text;
+    for (const NeedWords& words : kNeeds)
+    {
+        const auto count = std::ranges::count(report.findings, words.need, &AlignFinding::need);
+        if (count == 0)
+            continue;
+        text +=
+            (text.empty() ? "" : ", ") + std::to_string(count) + ' ' + (count == 1 ? words.one : words.many);
+    }
+    return text.empty() ? "nothing to mend" : text;
+}
+
+bool SelectProfile(const COptions& options, CShellContent& content)
+{
+    std::optional<CProfileFit> nearest;
+    return options.profile.empty() ? content.SelectFittingProfile(options.files[0], nearest)
+                                   : content.SelectProfile(options.profile);
+}
+
+void WriteJson(const COptions& options, const CShellWindow& window, const AlignReport& report, bool written)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("source").Text(options.files[0]);
+    json.Key("output").Text(options.output);
+    json.Key("outcome").Text(written ? "aligned" : "failed");
+    json.Key("referenceFrame").Integer(report.referenceFrame);
+    json.Key("mended").BeginArray();
+    for (const AlignFinding& finding : report.findings)
+    {
+        json.BeginObject();
+        json.Key("need").Text(CodeOf(finding.need));
+        json.Key("joint").Text(finding.joint);
+        json.Key("degrees").Number(static_cast<float>(finding.degrees));
+        json.EndObject();
+    }
+    json.EndArray();
+    WriteReports(json, window.Reports());
+    json.EndObject();
+    json.EndDocument();
+}
+
+bool Align(const COptions& options, CShellWindow& window, CShellContent& content)
+{
+    return content.OpenSource() != 0 && !window.HasFailed() && SelectProfile(options, content) &&
+           content.WriteAligned(options.output);
+}
+
+} // namespace
+
+EExit RunAlign(const COptions& options)
+{
+    if (!HasExtension(options.output, ".bvh"))
+    {
+        SayError(Printable(options.output) + ": an aligned motion is a .bvh file");
+        return EExit::Usage;
+    }
+    if (!MayWrite(options, options.output))
+        return EExit::Failed;
+    CShellWindow window(options);
+    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
+    CShellContent content(window, platform, PickFor(options));
+    window.SetPaths(options.files[0], {});
+    content.SetChoices({true, false});
+    const bool written = Align(options, window, content);
+    if (options.json)
+        WriteJson(options, window, content.AlignedReport(), written);
+    else if (written && !options.quiet)
+        std::printf("%s -> %s: %s\n", Printable(options.files[0]).c_str(), Printable(options.output).c_str(),
+                    MendedText(content.AlignedReport()).c_str());
+    return written ? EExit::Done : EExit::Failed;
+}
+
+} // namespace gw

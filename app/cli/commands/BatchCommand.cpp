@@ -1,0 +1,128 @@
+#include "CBatchRun.h"
+#include "CCntComboExControl.h"
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "Paths.h"
+#include "ProfileFit.h"
+#include "ReportJson.h"
+#include "RunSetup.h"
+#include "SourceList.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <optional>
+
+namespace gw {
+
+namespace {
+
+// The desktop program takes the profile that is selected. Without --profile it is the one that `convert`
+// would take for the first file.
+bool SelectProfile(const COptions& options, CShellWindow& window, CShellContent& content,
+                   const std::string& first)
+{
+    if (options.job != "htr")
+        return true;
+    if (!options.profile.empty())
+        return content.SelectProfile(options.profile);
+    window.SetPaths(first, {});
+    if (content.OpenSource() == 0 || window.HasFailed())
+        return false;
+    std::optional<CProfileFit> nearest;
+    return content.SelectFittingProfile(first, nearest);
+}
+
+void WriteJson(const COptions& options, const std::vector<CReport>& reports, size_t finished)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("folder").Text(options.files.empty() ? std::string() : options.files[0]);
+    json.Key("job").Text(options.job);
+    json.Key("finished").Integer(static_cast<int64_t>(finished));
+    WriteReports(json, reports);
+    json.EndObject();
+    json.EndDocument();
+}
+
+// The file that ended the run is none of those that were finished.
+size_t FinishedCount(const COptions& options, const CBatchRun& run, bool failed)
+{
+    const size_t taken = run.TakenCount();
+    if (options.keepGoing)
+        return taken - run.Tally()[EConversion::Failed];
+    return failed && taken > 0 ? taken - 1 : taken;
+}
+
+EExit RunBatchJobs(const COptions& options, const CFileRun::Jobs& jobs)
+{
+    CShellWindow window(options);
+    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
+    CShellContent content(window, platform);
+    CBatchRun run(options, jobs, StateOf(options), content, window);
+    const bool begins = SelectProfile(options, window, content, jobs.front().source);
+    const EExit exit = begins ? run.RunAll() : EExit::Failed;
+    std::vector<CReport> reports = window.Reports();
+    reports.insert(reports.end(), run.Reports().begin(), run.Reports().end());
+    const bool failed = exit == EExit::Failed || !std::ranges::all_of(reports, &CReport::warning);
+    if (options.json)
+        WriteJson(options, reports, FinishedCount(options, run, failed));
+    return exit == EExit::Done && failed ? EExit::Failed : exit;
+}
+
+// The folder alone and results beside their sources, as in the desktop program; with an output folder all
+// that lies below as well.
+bool ListJobs(const COptions& options, CFileRun::Jobs& jobs)
+{
+    const EBatchJob job = BatchJobOf(options);
+    const std::string_view extensions[] = {BatchSource(job)};
+    std::vector<CSource> sources;
+    if (options.outputFolder.empty() && options.filesFrom.empty())
+    {
+        for (const std::string& name : FilesInFolder(options.files[0], extensions[0]))
+            sources.push_back({WithSeparator(options.files[0]) + name, name});
+    }
+    else if (!ListSources(options, extensions, sources))
+    {
+        return false;
+    }
+    for (const CSource& source : sources)
+        jobs.push_back({source.path, OutputOf(options.outputFolder, source, BatchResult(job))});
+    return true;
+}
+
+EExit Refuse(const std::string& words)
+{
+    SayError(words);
+    return EExit::Failed;
+}
+
+} // namespace
+
+EExit RunBatchFolder(const COptions& options)
+{
+    if (!options.files.empty() && !FolderExists(options.files[0]))
+        return Refuse(Printable(options.files[0]) + ": there is no such folder");
+    if (!IsRunPossible(options))
+        return EExit::Usage;
+    if (!options.files.empty() && !CanListFolder(options, options.files[0]))
+        return EExit::Failed;
+    CFileRun::Jobs jobs;
+    if (!ListJobs(options, jobs))
+        return EExit::Failed;
+    if (!AreOutputsApart(jobs))
+        return EExit::Usage;
+    if (jobs.empty())
+        return Refuse(Printable(options.files.empty() ? options.filesFrom : options.files[0]) +
+                      ": the folder holds no " + std::string(BatchSource(BatchJobOf(options))) + " file");
+    if (!MakeOutputFolder(options))
+        return EExit::Failed;
+    return RunBatchJobs(options, jobs);
+}
+
+} // namespace gw

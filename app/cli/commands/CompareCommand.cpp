@@ -1,0 +1,159 @@
+#include "BonePairs.h"
+#include "CConversionPage.h"
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CKeyframeControl.h"
+#include "CPagePart.h"
+#include "CSceneFile.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "CheckResult.h"
+#include "CommandTable.h"
+#include "CompareReport.h"
+#include "ConvertedMotion.h"
+#include "PackagedMotion.h"
+#include "PageOutput.h"
+#include "Paths.h"
+#include "ProfileFile.h"
+#include "Text.h"
+#include "Words.h"
+
+namespace gw {
+
+namespace {
+
+// The result of a conversion, out of its package where it lies in one.
+bool LoadResult(const COptions& options, const std::string& path, CMotionFile& motion)
+{
+    if (HasExtension(path, ".Kinetra"))
+        return LoadPackagedMotion(path, motion);
+    const bool loaded = motion.Load(path);
+    if (!loaded)
+        SayFailure(path, motion.Record().Failure());
+    SayWarnings(options, path, motion.Record());
+    return loaded;
+}
+
+// The source as its file has it, or as a conversion with --align reads it.
+class CComparedSource
+{
+public:
+    explicit CComparedSource(const COptions& options)
+        : m_kOptions(options), m_kWindow(options), m_kPlatform(EPlatformWriting::No, options.dataFolder),
+          m_kContent(m_kWindow, m_kPlatform, EStockPick::Never)
+    {
+    }
+
+    std::string FindProfile() { return m_kContent.ResolveProfile(m_kOptions.profile); }
+    bool Load(const std::string& profilePath) { return m_kOptions.align ? Align(profilePath) : LoadFile(); }
+    MotionClip Clip();
+
+private:
+    bool Align(const std::string& profilePath);
+    bool LoadFile();
+
+    const COptions& m_kOptions;
+    CShellWindow m_kWindow;
+    CFilePlatform m_kPlatform;
+    CShellContent m_kContent;
+    CSceneFile m_kFile;
+};
+
+bool CComparedSource::Align(const std::string& profilePath)
+{
+    m_kWindow.SetPaths(m_kOptions.files[0], {});
+    m_kContent.SetChoices({true, false});
+    return m_kContent.OpenSource() != 0 && m_kContent.SelectProfile(profilePath) &&
+           m_kContent.ConvertMotion() != 0;
+}
+
+bool CComparedSource::LoadFile()
+{
+    if (!m_kFile.LoadWhole(m_kOptions.files[0]))
+        return false;
+    SayWarnings(m_kOptions, m_kOptions.files[0], m_kFile.Record());
+    return true;
+}
+
+// A container moves by its first track, under its first node.
+MotionClip CComparedSource::Clip()
+{
+    if (m_kOptions.align)
+        return SourceClipOf(m_kContent);
+    if (!m_kFile.IsContainer())
+        return ClipOf(m_kFile.Motion());
+    const std::vector<CFoundNode> nodes = m_kFile.Nodes();
+    const CKeyframeControl* track = m_kFile.FirstTrack();
+    if (nodes.empty() || !track)
+        return {};
+    return {nodes.front().node, track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
+}
+
+bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vector<BonePair>& pairs)
+{
+    std::vector<PairMisfit> misfits;
+    if (!ReadBonePairs(profilePath, source, result, pairs, misfits))
+    {
+        SayError(Printable(profilePath) + ": the profile cannot be read");
+        return false;
+    }
+    for (const PairMisfit& misfit : misfits)
+        SayError(Printable(profilePath) + ':' + std::to_string(misfit.line) + ": " +
+                 (misfit.sourceFound ? "the result has no bone " + Quoted(misfit.target)
+                                     : "the source has no bone " + Quoted(misfit.source)));
+    return misfits.empty();
+}
+
+bool WriteComparison(const COptions& options, const std::string& profilePath, const MotionClip& source,
+                     const MotionClip& result, const MeasuredConversion& measured)
+{
+    ConvertedMotion motion;
+    motion.source = options.files[0];
+    motion.result = options.files[1];
+    motion.profile = ReadProfileName(profilePath);
+    motion.sourceClip = source;
+    motion.resultClip = result;
+    motion.measured = &measured;
+    CPagePart part(1, 1);
+    part.Show(motion);
+    CConversionPage page;
+    page.Add(motion.source, part);
+    return WritePage(options, page);
+}
+
+} // namespace
+
+EExit RunCompare(const COptions& options)
+{
+    if (const EExit page = CheckPagePath(options); page != EExit::Done)
+        return page;
+    if (!HasPageFolder(options))
+        return EExit::Failed;
+    CComparedSource source(options);
+    CMotionFile result;
+    const std::string profilePath = source.FindProfile();
+    if (profilePath.empty() || !source.Load(profilePath) || !LoadResult(options, options.files[1], result))
+        return EExit::Failed;
+    const MotionClip sourceClip = source.Clip();
+    const MotionClip resultClip = ClipOf(result);
+    std::vector<BonePair> pairs;
+    if (!Pair(profilePath, sourceClip.root, resultClip.root, pairs))
+        return EExit::Failed;
+    MeasuredConversion measured;
+    ConversionDetail* const detail = options.html.empty() ? nullptr : &measured.detail;
+    measured.sums = MeasureConversion(sourceClip, resultClip, pairs, detail);
+    if (measured.sums.frameCount == 0)
+    {
+        SayError("there is nothing to compare: a motion has no frames");
+        return EExit::Failed;
+    }
+    if (options.json)
+        WriteMeasures(measured.sums);
+    else
+        PrintMeasures(measured.sums);
+    const bool isWritten =
+        options.html.empty() || WriteComparison(options, profilePath, sourceClip, resultClip, measured);
+    return isWritten ? EExit::Done : EExit::Failed;
+}
+
+} // namespace gw

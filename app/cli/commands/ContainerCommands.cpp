@@ -1,0 +1,81 @@
+#include "CCustomData.h"
+#include "COrrinStream.h"
+#include "CSafeFile.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "PackageBlocks.h"
+#include "PackagedMotion.h"
+#include "Packaging.h"
+#include "Paths.h"
+#include "Text.h"
+#include "Words.h"
+
+namespace gw {
+
+namespace {
+
+constexpr float kPackageSixty = 60.0f; // what every package says behind its rate
+
+EExit Fail(const std::string& path, EFailure reason)
+{
+    SayFailure(path, {reason, 0, {}});
+    return EExit::Failed;
+}
+
+bool WriteWhole(const std::string& path, std::span<const std::byte> bytes)
+{
+    CSafeFile file;
+    return file.Open(path) && file.Write(bytes) && file.Commit();
+}
+
+} // namespace
+
+EExit RunResave(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    COrrinStream scene;
+    if (!MayWrite(options, output) || !LoadWhole(scene, source))
+        return EExit::Failed;
+    SayWarnings(options, source, scene.Record());
+    if (!scene.SaveFile(output))
+        return Fail(output, scene.Record().Failure().reason);
+    return TellWritten(options, source, output);
+}
+
+EExit RunExtract(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    COrrinStream scene;
+    if (!MayWrite(options, options.output) || !LoadWhole(scene, source))
+        return EExit::Failed;
+    const CPackageBlocks blocks = FindPackage(scene);
+    if (!blocks.file)
+    {
+        SayError(Printable(source) + ": this is no Kinetra file: the data blocks \"MotionInfo\" and "
+                                     "\"MotionFile\" are expected among the roots");
+        return EExit::Failed;
+    }
+    CPackageFacts facts;
+    const std::string inside = ReadPackageFacts(*blocks.info, facts) ? FormatExtension(facts.format) : "";
+    if (!inside.empty() && !HasExtension(options.output, inside))
+        SayWord(options, "warning: " + Printable(source) + " holds an " + inside + " file");
+    if (!WriteWhole(options.output, blocks.file->Data()))
+        return Fail(options.output, EFailure::WriteError);
+    return TellWritten(options, source, options.output);
+}
+
+EExit RunPackage(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    if (!MayWrite(options, output))
+        return EExit::Failed;
+    CFailureRecord record;
+    PackageMotion(source, output, options.rate, kPackageSixty, record);
+    if (const CFailure& failure = record.Failure())
+        return Fail(failure.name.empty() ? output : failure.name, failure.reason);
+    return TellWritten(options, source, output);
+}
+
+} // namespace gw

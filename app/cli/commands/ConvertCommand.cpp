@@ -1,0 +1,118 @@
+#include "CConversionPage.h"
+#include "CConversionRun.h"
+#include "CPagePart.h"
+#include "CommandTable.h"
+#include "ConversionJobs.h"
+#include "Output.h"
+#include "PageOutput.h"
+#include "Paths.h"
+#include "RunSetup.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <optional>
+
+namespace gw {
+
+namespace {
+
+bool Refuse(const std::string& words)
+{
+    SayError(words);
+    return false;
+}
+
+// The file that will be written for a name: a name without an extension gets the save dialog's, and an .htr
+// is written in small letters.
+bool ResolveOutput(std::string& output)
+{
+    const CPathParts parts = SplitPath(output);
+    if (parts.extension.empty())
+        output += ".Kinetra";
+    else if (EqualNoCase(parts.extension, ".htr"))
+        output = parts.folder + parts.stem + ".htr";
+    else if (!EqualNoCase(parts.extension, ".Kinetra"))
+        return Refuse(Printable(output) + ": a result is a .Kinetra or an .htr file");
+    return true;
+}
+
+bool PlanOne(const COptions& options, CFileRun::Jobs& jobs)
+{
+    if (options.resume)
+        return Refuse("--resume is for many files; it needs --out-dir DIR");
+    const std::string& source = options.files[0];
+    std::string output = options.output;
+    if (output.empty())
+        output = SplitPath(source).folder + SplitPath(source).stem + ".Kinetra";
+    if (!ResolveOutput(output))
+        return false;
+    jobs.push_back({source, output});
+    return true;
+}
+
+bool IsOne(const COptions& options)
+{
+    return options.files.size() == 1 && options.filesFrom.empty() && options.outputFolder.empty() &&
+           !FolderExists(options.files[0]);
+}
+
+// In this process: a crash costs nothing else.
+EExit RunOne(const COptions& options, const CConversionJob& job)
+{
+    std::optional<CPagePart> part;
+    if (IsPageAsked(options))
+        part.emplace(1, 1);
+    const EConversion outcome = ConvertFile(options, job, nullptr, part ? &*part : nullptr, EProcess::Ends);
+    bool isWritten = true;
+    if (part && part->HasFigures())
+    {
+        CConversionPage page;
+        page.Add(job.source, *part);
+        isWritten = WritePage(options, page);
+    }
+    return outcome == EConversion::Failed || !isWritten ? EExit::Failed : EExit::Done;
+}
+
+EExit ConvertOne(const COptions& options)
+{
+    CFileRun::Jobs jobs;
+    if (!PlanOne(options, jobs))
+        return EExit::Usage;
+    if (!HasPageFolder(options))
+        return EExit::Failed;
+    return options.report.empty() ? RunOne(options, jobs[0]) : CConversionRun(options, jobs, {}).RunAll();
+}
+
+bool IsManyPossible(const COptions& options)
+{
+    if (options.outputFolder.empty())
+        return Refuse("several sources, or a folder, need --out-dir DIR");
+    if (!options.output.empty())
+        return Refuse("-o names a single file; with --out-dir every result takes the name of its source");
+    return true;
+}
+
+EExit ConvertMany(const COptions& options)
+{
+    CFileRun::Jobs jobs;
+    if (!IsManyPossible(options))
+        return EExit::Usage;
+    if (const EExit listed = ListConversions(options, jobs); listed != EExit::Done)
+        return listed;
+    if (!MakeOutputFolder(options) || !HasPageFolder(options)) // which may be the same
+        return EExit::Failed;
+    return CConversionRun(options, jobs, StateOf(options)).RunAll();
+}
+
+} // namespace
+
+EExit RunConvert(const COptions& options)
+{
+    if (!IsDecidedOnExisting(options) || !IsRunPossible(options))
+        return EExit::Usage;
+    if (const EExit page = CheckPagePath(options); page != EExit::Done)
+        return page;
+    return IsOne(options) ? ConvertOne(options) : ConvertMany(options);
+}
+
+} // namespace gw

@@ -1,0 +1,218 @@
+#include "CFileExam.h"
+#include "CJsonWriter.h"
+#include "CSceneFile.h"
+#include "CommandTable.h"
+#include "FindingWords.h"
+#include "Output.h"
+#include "Paths.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+void ExamineOther(const std::string& path, CFileExam& exam)
+{
+    CSceneFile file;
+    const bool read = file.Load(path);
+    exam.TakeRecord(path, file.Record());
+    if (read && !file.IsContainer())
+        exam.ExaminePoses(file.Motion());
+}
+
+void Examine(const std::string& path, CFileExam& exam)
+{
+    if (HasExtension(path, ".bvh"))
+        exam.ExamineBVH(path);
+    else
+        ExamineOther(path, exam);
+}
+
+void PrintLine(const std::string& line)
+{
+    std::printf("%s\n", line.c_str());
+}
+
+// Notes are among the facts.
+void PrintFaults(const std::string& path, const CFindings& findings)
+{
+    for (const Finding& finding : findings.Sorted())
+    {
+        if (finding.severity != ESeverity::Note)
+            PrintLine(FindingLine(path, finding));
+    }
+}
+
+void Print(const COptions& options, const std::string& path, const CFileExam& exam)
+{
+    PrintFaults(path, exam.Findings());
+    if (options.quiet)
+        return;
+    if (!exam.Facts() && !exam.Findings().HasFaults())
+        PrintLine(Printable(path) + ": whole; a container has no poses to examine");
+    if (!exam.Facts())
+        return;
+    const bool mixed = exam.Findings().Has(EFault::MixedChannels);
+    PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()) + (mixed ? ", rotation orders: mixed" : ""));
+}
+
+// `fixed` says whether a mended copy was written.
+void WriteFinding(CJsonWriter& json, const std::string& path, const Finding& finding, bool fixed)
+{
+    json.BreakLine();
+    json.BeginObject();
+    json.Key("line").Integer(static_cast<int64_t>(finding.where));
+    json.Key("code").Text(FindingCode(finding));
+    json.Key("severity").Text(SeverityName(finding.severity));
+    json.Key("name").Text(finding.name);
+    json.Key("words").Text(FindingWords(path, finding));
+    json.Key("remedy").Text(FindingRemedy(finding));
+    json.Key("more").Integer(static_cast<int64_t>(finding.more));
+    json.Key("fixable").Bool(finding.mendable);
+    json.Key("fixed").Bool(finding.mendable && fixed);
+    json.EndObject();
+}
+
+void WriteFindings(CJsonWriter& json, const std::string& path, const CFindings& findings, bool fixed)
+{
+    json.BeginArray();
+    for (const Finding& finding : findings.Sorted())
+        WriteFinding(json, path, finding, fixed);
+    json.EndArray();
+}
+
+void WriteFacts(CJsonWriter& json, const std::optional<MotionFacts>& facts)
+{
+    if (!facts)
+        return json.Null();
+    json.BeginObject();
+    json.Key("joints").Integer(static_cast<int64_t>(facts->jointCount));
+    json.Key("frames").Integer(static_cast<int64_t>(facts->frameCount));
+    json.Key("frameSeconds").Number(static_cast<float>(facts->frameSeconds));
+    json.Key("leg").Number(static_cast<float>(facts->leg));
+    json.Key("unit").Text(facts->unit);
+    json.Key("up").Text(facts->up);
+    json.Key("restPose").Text(RestPoseName(facts->restPose));
+    json.Key("body").Text(BodySourceName(facts->body));
+    json.EndObject();
+}
+
+// The object of a file without its end, so that a mended copy can stand in it.
+void BeginJson(CJsonWriter& json, const std::string& path, const CFileExam& exam, bool fixed)
+{
+    json.BeginObject();
+    json.Key("file").Text(path);
+    json.Key("healthy").Bool(!exam.Findings().HasFaults());
+    json.Key("facts");
+    WriteFacts(json, exam.Facts());
+    json.Key("findings");
+    WriteFindings(json, path, exam.Findings(), fixed);
+}
+
+void Tell(const COptions& options, const std::string& path, const CFileExam& exam)
+{
+    if (!options.json)
+        return Print(options, path, exam);
+    CJsonWriter json(stdout);
+    BeginJson(json, path, exam, false);
+    json.EndObject();
+    json.EndDocument();
+}
+
+EExit ExamineFile(const COptions& options, const std::string& path)
+{
+    CFileExam exam;
+    Examine(path, exam);
+    Tell(options, path, exam);
+    return exam.Findings().HasFaults() ? EExit::Failed : EExit::Done;
+}
+
+bool Refuse(const std::string& words)
+{
+    SayError(words);
+    return false;
+}
+
+bool CanFix(const COptions& options)
+{
+    if (options.files.size() != 1)
+        return Refuse("--fix takes one file");
+    const std::string& source = options.files[0];
+    if (!HasExtension(source, ".bvh") || !HasExtension(options.fix, ".bvh"))
+        return Refuse("--fix mends a .bvh into another .bvh");
+    if (IsSameFile(source, options.fix))
+        return Refuse(Printable(source) + ": a file is never mended in place; name another one behind --fix");
+    return true;
+}
+
+void WriteFixedJson(const COptions& options, const CFileExam& exam, const CFileExam& copy)
+{
+    CJsonWriter json(stdout);
+    BeginJson(json, options.files[0], exam, true);
+    json.Key("output").Text(options.fix);
+    json.Key("left");
+    WriteFindings(json, options.fix, copy.Findings(), false);
+    json.EndObject();
+    json.EndDocument();
+}
+
+void TellFixed(const COptions& options, const CFileExam& exam, const CFileExam& copy)
+{
+    if (options.json)
+        return WriteFixedJson(options, exam, copy);
+    const std::string& source = options.files[0];
+    Print(options, source, exam);
+    std::string line = Printable(source) + " -> " + Printable(options.fix) + ": ";
+    line += exam.Findings().HasFaults() ? "mended" : "nothing to mend";
+    if (copy.Findings().HasFaults())
+        line += ", but this is left";
+    PrintLine(line);
+    PrintFaults(options.fix, copy.Findings());
+}
+
+// Only what the copy is like counts: whoever goes on takes that.
+EExit FixFile(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    CFileExam exam;
+    Examine(source, exam);
+    if (exam.Findings().HasFaults() && !exam.Findings().MendsAny())
+    {
+        Tell(options, source, exam);
+        SayError(Printable(source) + ": nothing of this can be mended; no copy was written");
+        return EExit::Failed;
+    }
+    if (!exam.WriteMended(options.fix))
+    {
+        SayFailure(options.fix, {EFailure::WriteError, 0, {}});
+        return EExit::Failed;
+    }
+    CFileExam copy;
+    Examine(options.fix, copy);
+    TellFixed(options, exam, copy);
+    return copy.Findings().HasFaults() ? EExit::Failed : EExit::Done;
+}
+
+} // namespace
+
+EExit RunDoctor(const COptions& options)
+{
+    if (!options.fix.empty())
+    {
+        if (!CanFix(options))
+            return EExit::Usage;
+        return MayWrite(options, options.fix) ? FixFile(options) : EExit::Failed;
+    }
+    EExit exit = EExit::Done;
+    for (const std::string& path : options.files)
+    {
+        if (ExamineFile(options, path) != EExit::Done)
+            exit = EExit::Failed;
+    }
+    return exit;
+}
+
+} // namespace gw

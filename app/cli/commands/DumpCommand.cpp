@@ -1,0 +1,57 @@
+#include "CHTMLDump.h"
+#include "COrnHTMLPage.h"
+#include "CSceneFile.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "Paths.h"
+#include "Text.h"
+#include "TreeViewScript.h"
+#include "Words.h"
+
+namespace gw {
+
+namespace {
+
+EExit Fail(const std::string& path, const std::string& words)
+{
+    SayError(Printable(path) + ": " + words);
+    return EExit::Failed;
+}
+
+bool WriteTreeView(const std::string& folder)
+{
+    COrnHTMLPage script;
+    std::string text(kTreeViewScript);
+    text.pop_back(); // each line of a page gets its line feed when it is written
+    script.AddLine(std::move(text));
+    return script.SaveAs(folder + "TreeView.js");
+}
+
+} // namespace
+
+EExit RunDump(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    CSceneFile file;
+    if (!file.LoadWhole(source))
+        return EExit::Failed;
+    SayWarnings(options, source, file.Record());
+    const std::vector<CObject*> roots = file.Roots();
+    if (roots.empty())
+        SayWord(options, "warning: " + Printable(source) + ": there is no root to show");
+    const std::string folder = WithSeparator(options.outputFolder);
+    if (!CreateFolder(options.outputFolder))
+        return Fail(folder, "the folder cannot be made");
+    if (!WriteTreeView(folder))
+        return Fail(folder + "TreeView.js", "the file cannot be written");
+
+    CHTMLDump dump(folder);
+    for (CObject* root : roots)
+        TellWritten(options, source, folder + dump.WriteSite(*root));
+    if (dump.FailedCount() == 0)
+        return EExit::Done;
+    return Fail(folder, std::to_string(dump.FailedCount()) + " of " + std::to_string(dump.PageCount()) +
+                            " pages cannot be written");
+}
+
+} // namespace gw

@@ -1,0 +1,144 @@
+#include "CJsonWriter.h"
+#include "CKeyframeControl.h"
+#include "CSceneFile.h"
+#include "CommandTable.h"
+#include "InfoContainer.h"
+#include "PackageBlocks.h"
+#include "Paths.h"
+#include "ReportJson.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+// What a track says about time.
+struct Timing
+{
+    int64_t frames = 0;
+    float lastFrame = 0.0f;
+    float frameSeconds = 0.0f;
+
+    float Rate() const { return 1.0f / frameSeconds; }
+    float Seconds() const { return lastFrame * frameSeconds; }
+};
+
+Timing TimingOf(const CKeyframeControl* track)
+{
+    if (!track)
+        return {};
+    const size_t frames = std::max({track->m_kKeyTimes.size(), track->m_kRotationTimes.size(),
+                                    track->m_kPositionTimes.size(), track->m_kScaleTimes.size()});
+    return {static_cast<int64_t>(frames), track->m_fEndTime, track->m_fFrequency};
+}
+
+// A batch run writes packages as .orn, so that the name does not tell.
+std::string FormatOf(const std::string& path, CSceneFile& file)
+{
+    if (file.IsContainer())
+        return FindPackage(file.Scene()).info ? "Kinetra" : "orn";
+    return LowerCase(SplitPath(path).extension).substr(1);
+}
+
+void PrintTiming(const Timing& timing)
+{
+    if (timing.frames == 0)
+    {
+        std::puts("frames:  none");
+        return;
+    }
+    std::printf("frames:  %lld\n", static_cast<long long>(timing.frames));
+    std::printf("rate:    %g per second (%g s each)\n", timing.Rate(), timing.frameSeconds);
+    std::printf("length:  %g s\n", timing.Seconds());
+}
+
+void PrintBones(const std::vector<CFoundNode>& nodes)
+{
+    std::printf("bones:   %zu\n", nodes.size());
+    for (const CFoundNode& found : nodes)
+        PrintIndented(found.depth + 1, Printable(found.node->NameView()));
+}
+
+void WriteTiming(CJsonWriter& json, const Timing& timing)
+{
+    json.Key("frames").Integer(timing.frames);
+    json.Key("lastFrame").Number(timing.lastFrame);
+    json.Key("frameSeconds").Number(timing.frameSeconds);
+    json.Key("rate").Number(timing.frames == 0 ? 0.0f : timing.Rate());
+    json.Key("seconds").Number(timing.Seconds());
+}
+
+void WriteBones(CJsonWriter& json, const std::vector<CFoundNode>& nodes)
+{
+    json.Key("bones").BeginArray();
+    for (const CFoundNode& found : nodes)
+    {
+        json.BreakLine();
+        json.BeginObject();
+        json.Key("name").Text(found.node->NameView());
+        json.Key("parent");
+        if (found.parent)
+            json.Text(found.parent->NameView());
+        else
+            json.Null();
+        json.EndObject();
+    }
+    json.EndArray();
+}
+
+void Print(const std::string& path, CSceneFile& file)
+{
+    std::printf("file:    %s\nformat:  %s\n", Printable(path).c_str(), FormatOf(path, file).c_str());
+    if (file.IsContainer())
+        PrintContainer(file.Scene());
+    const Timing timing = TimingOf(file.FirstTrack());
+    if (!file.IsContainer() || timing.frames != 0)
+        PrintTiming(timing);
+    PrintBones(file.Nodes());
+    if (file.IsContainer())
+        PrintObjects(file.Scene());
+}
+
+void WriteJson(const std::string& path, CSceneFile& file)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("file").Text(path);
+    json.Key("format").Text(FormatOf(path, file));
+    WriteTiming(json, TimingOf(file.FirstTrack()));
+    WriteBones(json, file.Nodes());
+    WriteRecord(json, path, file.Record());
+    if (file.IsContainer())
+        WriteContainer(json, file.Scene());
+    json.EndObject();
+    json.EndDocument();
+}
+
+} // namespace
+
+EExit RunInfo(const COptions& options)
+{
+    const std::string& path = options.files[0];
+    CSceneFile file;
+    file.Scene().SetPictureLimit(0); // names are all that is printed of linked pictures
+    if (!file.Load(path))
+    {
+        SayFailure(path, file.Failure());
+        return EExit::Failed;
+    }
+    if (options.json)
+        WriteJson(path, file);
+    else
+        Print(path, file);
+    SayWarnings(options, path, file.Record());
+    if (!file.IsDamaged())
+        return EExit::Done;
+    SayDamage(path, file.Failure());
+    return EExit::Failed;
+}
+
+} // namespace gw

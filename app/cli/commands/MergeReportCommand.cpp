@@ -1,0 +1,149 @@
+#include "CMappedFile.h"
+#include "CReport.h"
+#include "CSafeFile.h"
+#include "CommandTable.h"
+#include "FailureWords.h"
+#include "Output.h"
+#include "PlanFile.h"
+#include "ReportJson.h"
+#include "RunTally.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <unordered_map>
+
+namespace gw {
+
+namespace {
+
+/// The line of a report about an output.
+struct ReportLineOf
+{
+    std::string text;
+    EConversion outcome = EConversion::Failed;
+};
+
+using Lines = std::unordered_map<std::string, ReportLineOf>; // by output
+
+// A line that a killed run left cut is skipped. One that is nested too deeply was not written by a run.
+bool TakeLine(std::string_view text, Lines& lines)
+{
+    std::string output;
+    std::string outcome;
+    const EJsonFault fault = ReadReportLine(text, output, outcome);
+    for (const EConversion end : {EConversion::Converted, EConversion::Skipped, EConversion::Failed})
+    {
+        if (fault == EJsonFault::None && outcome == OutcomeName(end))
+            lines[output] = {std::string(text), end};
+    }
+    return fault != EJsonFault::TooDeep;
+}
+
+bool ReadReport(const std::string& path, Lines& lines)
+{
+    CMappedFile file;
+    if (file.Open(path) != EFailure::None)
+        return false;
+    std::string_view rest = file.Text();
+    size_t number = 0;
+    for (std::string_view line; NextLine(rest, line);)
+    {
+        ++number;
+        if (!TakeLine(line, lines))
+            SayError(Printable(path) + ':' + std::to_string(number) +
+                     ": this line is nested deeper than a report can be, and was skipped");
+    }
+    return true;
+}
+
+// Of a shard that was not run there is no report yet; its sources are left, and that is told.
+bool ReadReports(const COptions& options, const CRunPlan& plan, Lines& lines)
+{
+    const std::span named = std::span(options.files).subspan(1);
+    for (const std::string& path : named)
+    {
+        if (ReadReport(path, lines))
+            continue;
+        SayError(Printable(path) + ": the report cannot be read");
+        return false;
+    }
+    for (size_t shard = 0; named.empty() && shard < plan.shardCount; ++shard)
+        ReadReport(ShardReport(options.files[0], shard), lines);
+    return true;
+}
+
+void SayFailures(const COptions& options, const std::string& line)
+{
+    std::vector<CReport> reports;
+    ReadReports(line, reports);
+    for (const CReport& report : reports)
+        SayReport(options, report);
+}
+
+// Puts the lines into the order of the plan and counts how they ended.
+std::string Join(const COptions& options, const CRunPlan& plan, const Lines& lines, CRunTally& tally)
+{
+    std::string joined;
+    for (const CRunPlan::Entry& entry : plan.entries)
+    {
+        const auto found = lines.find(entry.output);
+        if (found == lines.end())
+        {
+            ++tally.left;
+            continue;
+        }
+        ++tally[found->second.outcome];
+        joined += found->second.text + '\n';
+        SayFailures(options, found->second.text);
+    }
+    return joined;
+}
+
+void SayLeft(const CRunPlan& plan, const Lines& lines)
+{
+    std::vector<size_t> left(plan.shardCount);
+    for (const CRunPlan::Entry& entry : plan.entries)
+        left[entry.shard] += lines.contains(entry.output) ? 0 : 1;
+    for (size_t shard = 0; shard < left.size(); ++shard)
+    {
+        if (left[shard] > 0)
+            SayError("shard " + std::to_string(shard) + ": " + std::to_string(left[shard]) +
+                     " sources are left; run it again");
+    }
+}
+
+bool Write(const COptions& options, const std::string& joined)
+{
+    if (options.output.empty())
+    {
+        std::fwrite(joined.data(), 1, joined.size(), stdout);
+        return true;
+    }
+    CSafeFile file;
+    if (file.Open(options.output) && file.Write(joined) && file.Commit())
+        return true;
+    SayError(Printable(options.output) + ": the report cannot be written");
+    return false;
+}
+
+} // namespace
+
+EExit RunMergeReport(const COptions& options)
+{
+    CRunPlan plan;
+    Lines lines;
+    if (!LoadPlan(options.files[0], plan) || !ReadReports(options, plan, lines))
+        return EExit::Failed;
+    if (!options.output.empty() && !MayWrite(options, options.output))
+        return EExit::Failed;
+    CRunTally tally;
+    if (!Write(options, Join(options, plan, lines, tally)))
+        return EExit::Failed;
+    SayLeft(plan, lines);
+    TellTally(options, tally);
+    return tally[EConversion::Failed] + tally.left == 0 ? EExit::Done : EExit::Failed;
+}
+
+} // namespace gw

@@ -1,0 +1,118 @@
+#include "CJsonMembers.h"
+#include "CJsonWriter.h"
+#include "CRunPlan.h"
+#include "CommandTable.h"
+#include "ConversionJobs.h"
+#include "JsonText.h"
+#include "OptionJson.h"
+#include "Output.h"
+#include "Paths.h"
+#include "PlanFile.h"
+#include "RunSetup.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+constexpr int64_t kShardLimit = 1'000'000;
+
+// A plan is JSON, which keeps no other names.
+bool IsUtf8(const std::string& text)
+{
+    CJsonMembers json;
+    std::string kept;
+    json.Read(CJsonLine().Add("text", text).Text());
+    return json.TakeText("text", kept) && kept == text;
+}
+
+bool MakePlan(const COptions& options, const CFileRun::Jobs& jobs, CRunPlan& plan)
+{
+    plan.version = GAITWRIGHT_VERSION;
+    plan.outputFolder = options.outputFolder;
+    plan.options = OptionsJson(options, ~kHowToRun);
+    plan.shardCount = static_cast<size_t>(*options.shards);
+    for (const CConversionJob& job : jobs)
+    {
+        CRunPlan::Entry entry{job.source, job.output};
+        FileSize(job.source, entry.byteCount);
+        if (!IsUtf8(entry.source) || !IsUtf8(entry.output))
+        {
+            SayError(Printable(job.source) +
+                     ": the name is no UTF-8, and a plan keeps no other; rename the file");
+            return false;
+        }
+        plan.entries.push_back(std::move(entry));
+    }
+    plan.Share();
+    return true;
+}
+
+void TellPlan(const COptions& options, const CRunPlan& plan)
+{
+    if (options.json)
+    {
+        CJsonWriter json(stdout);
+        json.BeginObject();
+        json.Key("plan").Text(options.output);
+        json.Key("sources").Integer(static_cast<int64_t>(plan.entries.size()));
+        json.Key("shards").Integer(static_cast<int64_t>(plan.shardCount));
+        json.EndObject();
+        json.EndDocument();
+    }
+    else if (!options.quiet)
+    {
+        std::printf("%s: %zu sources in %zu shards\n", Printable(options.output).c_str(), plan.entries.size(),
+                    plan.shardCount);
+    }
+}
+
+// A slip here would be found only when the shards run.
+bool AreSourcesThere(const COptions& options)
+{
+    for (const std::string& path : options.files)
+    {
+        if (IsTaken(path))
+            continue;
+        SayError(Printable(path) + ": there is no such file or folder");
+        return false;
+    }
+    return true;
+}
+
+bool AreShardsRight(const COptions& options)
+{
+    const bool right = *options.shards >= 1 && *options.shards <= kShardLimit;
+    if (!right)
+        SayError("--shards takes a number from 1 to 1000000");
+    return right;
+}
+
+} // namespace
+
+EExit RunPlan(const COptions& options)
+{
+    CFileRun::Jobs jobs;
+    if (!AreShardsRight(options) || !IsRunPossible(options))
+        return EExit::Usage;
+    if (!AreSourcesThere(options))
+        return EExit::Failed;
+    if (const EExit listed = ListConversions(options, jobs); listed != EExit::Done)
+        return listed;
+    CRunPlan plan;
+    if (!MayWrite(options, options.output) || !MakePlan(options, jobs, plan))
+        return EExit::Failed;
+    if (!WritePlan(options.output, plan))
+    {
+        SayError(Printable(options.output) + ": the plan cannot be written");
+        return EExit::Failed;
+    }
+    TellPlan(options, plan);
+    return EExit::Done;
+}
+
+} // namespace gw

@@ -1,0 +1,131 @@
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "CommandTable.h"
+#include "DoubtWords.h"
+#include "FitWords.h"
+#include "ProfileChoice.h"
+#include "ProfileFit.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <cstdio>
+#include <optional>
+
+namespace gw {
+
+namespace {
+
+struct Entry
+{
+    std::string name;
+    std::string path;
+    bool stock = false;
+    std::optional<CProfileFit> fit;        // with a source
+    std::optional<ProfileVerdict> verdict; // of one that fits
+};
+
+std::vector<Entry> Installed(CShellContent& content)
+{
+    std::vector<Entry> entries;
+    for (const CInstalledProfile& profile : content.InstalledProfiles())
+        entries.push_back({profile.name, profile.path, profile.stock, {}, {}});
+    return entries;
+}
+
+CProfileFit FitOf(const CShellContent& content, const ProfileChoice& choice)
+{
+    CProfileFit fit{
+        choice.profile.name, choice.match.rowCount, choice.match.foundCount, choice.match.drivesRoot, {}};
+    if (!choice.match.IsWhole())
+        content.Measure(choice.path, fit);
+    return fit;
+}
+
+// The one that a conversion takes first.
+std::vector<Entry> ByFit(CShellContent& content)
+{
+    const std::vector<CInstalledProfile> installed = content.InstalledProfiles();
+    std::vector<Entry> entries;
+    for (const ProfileChoice& choice : content.Choices())
+    {
+        const auto profile = std::ranges::find(installed, choice.path, &CInstalledProfile::path);
+        const bool stock = profile != installed.end() && profile->stock;
+        entries.push_back({choice.profile.name, choice.path, stock, FitOf(content, choice), {}});
+        if (choice.match.IsWhole())
+            entries.back().verdict = choice.verdict;
+    }
+    return entries;
+}
+
+// What a profile for another skeleton misses is nothing to read.
+std::string Missing(const CProfileFit& fit)
+{
+    return 2 * fit.foundCount < fit.rowCount ? "" : MissingLines(fit);
+}
+
+void Print(const Entry& entry)
+{
+    std::string line =
+        Printable(entry.name) + " (" + (entry.stock ? "stock" : "own") + ", " + Printable(entry.path) + ')';
+    if (entry.fit)
+        line += ": " + FitSummary(*entry.fit);
+    if (entry.verdict)
+        line += std::string(", ") + SurenessName(entry.verdict->sureness);
+    std::puts(line.c_str());
+    if (const std::string missing = entry.fit ? Missing(*entry.fit) : ""; !missing.empty())
+        std::puts(missing.c_str());
+    for (const std::string& words : entry.verdict ? DoubtWords(*entry.verdict) : std::vector<std::string>())
+        std::printf("  %s\n", words.c_str());
+}
+
+void WriteJson(const std::vector<Entry>& entries)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("profiles").BeginArray();
+    for (const Entry& entry : entries)
+    {
+        json.BreakLine();
+        json.BeginObject();
+        json.Key("name").Text(entry.name);
+        json.Key("path").Text(entry.path);
+        json.Key("stock").Bool(entry.stock);
+        if (entry.fit)
+            WriteFit(json, *entry.fit);
+        if (entry.verdict)
+            WriteVerdict(json, *entry.verdict);
+        json.EndObject();
+    }
+    json.EndArray();
+    json.EndObject();
+    json.EndDocument();
+}
+
+} // namespace
+
+EExit RunProfiles(const COptions& options)
+{
+    CShellWindow window(options);
+    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
+    CShellContent content(window, platform);
+    const bool hasSource = !options.files.empty();
+    if (hasSource)
+    {
+        window.SetPaths(options.files[0], {});
+        if (content.OpenSource() == 0 || window.HasFailed())
+            return EExit::Failed;
+    }
+    const std::vector<Entry> entries = hasSource ? ByFit(content) : Installed(content);
+    if (options.json)
+        WriteJson(entries);
+    for (const Entry& entry : options.json ? std::vector<Entry>() : entries)
+        Print(entry);
+    if (entries.empty())
+        SayWord(options, "no profile is installed");
+    return EExit::Done;
+}
+
+} // namespace gw

@@ -1,0 +1,249 @@
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CMotionFile.h"
+#include "CReport.h"
+#include "CSafeFile.h"
+#include "CShellContent.h"
+#include "CShellWindow.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "Paths.h"
+#include "ProfileFile.h"
+#include "SourceTiming.h"
+#include "SuggestProfile.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <cstdio>
+
+namespace gw {
+
+namespace {
+
+constexpr const char* kJointWords[] = {"hip",     "spine joint", "neck",  "head", "clavicle", "upper arm",
+                                       "forearm", "hand",        "thigh", "shin", "foot",     "toe"};
+constexpr const char* kSurenessWords[] = {"sure", "likely", "unsure"};
+
+constexpr const char* kEvidenceWords[] = {
+    "nothing tells",
+    "by its shape; its name says nothing",
+    "by its shape, against its name",
+    "by its name; its shape does not tell",
+    "by name and shape",
+};
+constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
+
+constexpr const char* kDoubtWords[] = {
+    "it does not hang from the joint that should carry it",
+    "left and right may be swapped",
+    "the joint before may be the upper arm",
+    "it may be the clavicle",
+    "the legs go up with the body",
+    "its bones are not in proportion",
+};
+constexpr const char* kDoubtCodes[] = {"not-below",       "sides-swapped", "clavicle-is-arm",
+                                       "arm-is-clavicle", "legs-up",       "odd-length"};
+
+constexpr const char* kKindCodes[] = {"turned", "neutral", "fixed", "no-source", "no-name"};
+
+template <class Enum, size_t count>
+const char* Text(const char* const (&words)[count], Enum value)
+{
+    return words[static_cast<size_t>(value)];
+}
+
+// "left upper arm"
+std::string PlaceWords(BodyPlace place)
+{
+    const std::string joint = Text(kJointWords, place.joint);
+    if (!HasSides(place.joint))
+        return joint;
+    return (place.side == EBodySide::Left ? "left " : "right ") + joint;
+}
+
+std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
+{
+    switch (row.kind)
+    {
+    case ESuggestedRow::Fixed:
+        return "no source, as in every profile";
+    case ESuggestedRow::NoSource:
+        return "left out: the skeleton has no " + PlaceWords(row.place) + " for it";
+    case ESuggestedRow::NoName:
+        return "left out: a profile cannot tell this joint by its name";
+    default:
+        break;
+    }
+    std::string reason =
+        std::string(Text(kSurenessWords, row.sureness)) + ": " + Text(kEvidenceWords, row.evidence);
+    for (const EBodyDoubt doubt : row.doubts)
+        reason += std::string("; ") + Text(kDoubtWords, doubt);
+    if (row.nudged)
+        reason += "; turned a little about itself, so that the bone below can be followed";
+    if (!profile.sidesAreSure && HasSides(row.place.joint))
+        reason += "; no pose shows which side is left";
+    return reason;
+}
+
+void PrintRows(const SuggestedProfile& profile)
+{
+    for (const SuggestedRow& row : profile.rows)
+    {
+        const auto& [x, y, z] = row.numbers.rotation;
+        const auto& [a, b, c] = row.numbers.axes;
+        char numbers[64] = "";
+        if (row.IsMapping())
+            std::snprintf(numbers, sizeof numbers, "%d,%d,%d,%d,%d,%d", x, y, z, a, b, c);
+        std::printf("%-11s %-24s %-20s %s\n", Printable(row.target).c_str(),
+                    row.source ? Printable(row.source->NameView()).c_str() : "-", numbers,
+                    Reason(row, profile).c_str());
+    }
+}
+
+void WriteNumbers(CJsonWriter& json, const char* key, const std::array<int, 3>& numbers)
+{
+    json.Key(key).BeginArray();
+    for (const int number : numbers)
+        json.Integer(number);
+    json.EndArray();
+}
+
+void WriteRow(CJsonWriter& json, const SuggestedRow& row)
+{
+    json.BreakLine();
+    json.BeginObject();
+    json.Key("target").Text(row.target);
+    json.Key("source").Text(row.source ? row.source->NameView() : "");
+    json.Key("joint").Text(row.kind == ESuggestedRow::Fixed ? "" : PlaceWords(row.place));
+    json.Key("kind").Text(Text(kKindCodes, row.kind));
+    if (row.IsMapping())
+    {
+        WriteNumbers(json, "rotation", row.numbers.rotation);
+        WriteNumbers(json, "axes", row.numbers.axes);
+        json.Key("sureness").Text(Text(kSurenessWords, row.sureness));
+        json.Key("evidence").Text(Text(kEvidenceCodes, row.evidence));
+        json.Key("doubts").BeginArray();
+        for (const EBodyDoubt doubt : row.doubts)
+            json.Text(Text(kDoubtCodes, doubt));
+        json.EndArray();
+        json.Key("restError");
+        if (row.restError)
+            json.Number(static_cast<float>(*row.restError));
+        else
+            json.Null();
+    }
+    json.EndObject();
+}
+
+void WriteJson(const COptions& options, const std::string& name, const SuggestedProfile& profile)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("source").Text(options.files[0]);
+    json.Key("output").Text(options.output);
+    json.Key("name").Text(name);
+    json.Key("sidesAreSure").Bool(profile.sidesAreSure);
+    json.Key("restIsStance").Bool(profile.restIsStance);
+    json.Key("rows").BeginArray();
+    for (const SuggestedRow& row : profile.rows)
+        WriteRow(json, row);
+    json.EndArray();
+    json.EndObject();
+    json.EndDocument();
+}
+
+// Says which of the thirteen joints were not found.
+EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
+{
+    std::string words = Printable(source) + ": no whole body was found by names or by shape; missing: ";
+    for (const BodyPlace& place : profile.missing)
+        words += (&place == profile.missing.data() ? "" : ", ") + PlaceWords(place);
+    SayError(words);
+    for (const SuggestedRow& row : profile.rows)
+    {
+        if (row.kind == ESuggestedRow::NoName)
+            SayError(Printable(source) + ": the " + PlaceWords(row.place) + " would be " +
+                     Quoted(row.source->NameView()) +
+                     ", but a profile cannot tell that joint by its name; rename it in the file");
+    }
+    return EExit::Failed;
+}
+
+bool WriteProfile(const std::string& path, const std::string& text)
+{
+    CSafeFile file;
+    if (file.Open(path) && file.Write(text) && file.Commit())
+        return true;
+    SayFailure(path, {EFailure::WriteError, 0, {}});
+    return false;
+}
+
+bool LoadTarget(const std::string& path, CMotionFile& target)
+{
+    const bool loaded = target.Load(path);
+    if (!loaded)
+        SayFailure(path, target.Record().Failure());
+    return loaded;
+}
+
+// Results last as long as the source only if the profile has the source's rate.
+void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
+{
+    if (sourceRate == profileRate)
+        return;
+    CReport report = ShellFailure(options.output, "rate",
+                                  "the source has " + std::to_string(sourceRate) +
+                                      " frames per second, and the nearest rate that a profile may have is " +
+                                      std::to_string(profileRate) + ", so results will play " +
+                                      (sourceRate < profileRate ? "faster" : "slower"));
+    report.warning = true;
+    SayReport(options, report);
+}
+
+// Writes the profile and prints its rows.
+EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
+{
+    const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
+    const int frameRate = ProfileRateOf(sourceRoot);
+    if (!WriteProfile(options.output, ProfileText(name, frameRate, kVec3Zero, profile.Table())))
+        return EExit::Failed;
+    WarnOfRate(options, SourceRateOf(sourceRoot), frameRate);
+    if (!profile.restIsStance)
+        SayWord(options,
+                "the rest pose is none that a body stands in; how bones are turned about themselves was "
+                "taken from a frame of the motion");
+    if (options.json)
+    {
+        WriteJson(options, name, profile);
+        return EExit::Done;
+    }
+    PrintRows(profile);
+    return TellWritten(options, options.files[0], options.output);
+}
+
+} // namespace
+
+EExit RunSuggest(const COptions& options)
+{
+    if (!HasExtension(options.output, ".prf"))
+    {
+        SayError(Printable(options.output) + ": a profile's file ends in .prf");
+        return EExit::Usage;
+    }
+    if (!MayWrite(options, options.output))
+        return EExit::Failed;
+    CShellWindow window(options);
+    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
+    CShellContent content(window, platform);
+    window.SetPaths(options.files[0], {});
+    CMotionFile target;
+    if (content.OpenSource() == 0 || window.HasFailed() || !content.SourceRoot() ||
+        !LoadTarget(platform.DataFolder() + "base.htr", target))
+        return EExit::Failed;
+    const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *target.motionRoot);
+    if (!profile.missing.empty())
+        return FailMissing(options.files[0], profile);
+    return Deliver(options, profile, content.SourceRoot());
+}
+
+} // namespace gw

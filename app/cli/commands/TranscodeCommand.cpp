@@ -1,0 +1,83 @@
+#include "CMotionFile.h"
+#include "CReport.h"
+#include "CommandTable.h"
+#include "Output.h"
+#include "Paths.h"
+#include "TKBVHStream.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+EExit Fail(const std::string& path, const CFailure& failure)
+{
+    SayFailure(path, failure);
+    return EExit::Failed;
+}
+
+bool CanTranscode(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    if (HasExtension(output, ".bvh"))
+    {
+        if (options.frameScale == 1.0f)
+            return true;
+        SayError("--frame-scale is for .htr files; a .bvh is written frame by frame");
+        return false;
+    }
+    if (HasExtension(output, ".htr") && HasExtension(source, ".htr"))
+        return true;
+    SayError(Printable(output) + ": an .htr can be written as .htr or .bvh, any other motion as .bvh; "
+                                 "'gaitwright convert' makes an .htr of it");
+    return false;
+}
+
+// A .bvh is written without the last frame, and its frame time has six digits behind the point.
+const char* WhyNoBVH(const CMotionFile& motion)
+{
+    constexpr float kLeastFrameTime = 0.0000005f;
+    if (motion.GetLastFrame() <= -1.0f)
+        return "the motion has no frames; there is nothing to write";
+    if (!(motion.GetFrequency() >= kLeastFrameTime) || !std::isfinite(motion.GetFrequency()))
+        return "the frame time is 0 or too small for a .bvh, which keeps six digits; no rate could be read "
+               "from it";
+    return nullptr;
+}
+
+} // namespace
+
+EExit RunTranscode(const COptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string& output = options.files[1];
+    if (!CanTranscode(options))
+        return EExit::Usage;
+    if (!MayWrite(options, output))
+        return EExit::Failed;
+    CMotionFile motion;
+    if (!motion.Load(source))
+        return Fail(source, motion.Record().Failure());
+    SayWarnings(options, source, motion.Record());
+    if (HasExtension(output, ".htr"))
+    {
+        if (!motion.Save(output, options.frameScale))
+            return Fail(output, motion.Record().Failure());
+        return TellWritten(options, source, output);
+    }
+    if (const char* const words = WhyNoBVH(motion))
+    {
+        SayReport(options, ShellFailure(source, "no-bvh", words));
+        return EExit::Failed;
+    }
+    TKBVHStream stream(motion);
+    if (!stream.WriteFile(output))
+        return Fail(output, stream.Record().Failure());
+    return TellWritten(options, source, output);
+}
+
+} // namespace gw

@@ -1,0 +1,350 @@
+#include "CFileRun.h"
+
+#include "CContentHash.h"
+#include "CFilePlatform.h"
+#include "CJsonWriter.h"
+#include "CReport.h"
+#include "CSafeFile.h"
+#include "CTextFile.h"
+#include "CWorkerPool.h"
+#include "CommandTable.h"
+#include "OptionJson.h"
+#include "Output.h"
+#include "Paths.h"
+#include "PrivateNames.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <charconv>
+#include <chrono>
+#include <cstring>
+#include <new>
+#include <numeric>
+#include <set>
+#include <thread>
+
+#include <sys/wait.h>
+
+namespace gw {
+
+namespace {
+
+constexpr uint8_t kEndsRun = 0x80;
+constexpr uint8_t kAbandons = 0x40;
+constexpr uint8_t kOutcomeBits = 0x0f;
+
+size_t WorkerCount(const COptions& options, size_t jobCount)
+{
+    const size_t cores = std::max(1u, std::thread::hardware_concurrency());
+    return std::min(options.jobs ? static_cast<size_t>(*options.jobs) : cores, jobCount);
+}
+
+// The members of a record that are the run's to say; what follows stays the same from run to run.
+std::string RecordHead(const CConversionJob& job)
+{
+    CTextFile text;
+    {
+        CJsonWriter json(text.File());
+        json.BeginObject();
+        json.Key("source").Text(job.source);
+        json.Key("output").Text(job.output);
+    }
+    return text.Text() + ',';
+}
+
+// A record of a writer, without its end, with how long it took.
+std::string Timed(std::string record, double seconds)
+{
+    record.resize(std::min(record.size(), record.rfind('}')));
+    char digits[64];
+    char* const end = std::to_chars(digits, std::end(digits), seconds, std::chars_format::fixed, 4).ptr;
+    return record + ",\"seconds\":" + std::string(&digits[0], end);
+}
+
+CReport LostReport(const CConversionJob& job, const CJobEnd& end, float limit)
+{
+    if (end.kind == CJobEnd::EKind::TimedOut)
+        return ShellFailure(job.source, "time-limit",
+                            "not done within " + std::to_string(static_cast<int64_t>(limit)) +
+                                " seconds, and given up; --time-limit allows more");
+    if (end.kind == CJobEnd::EKind::Ran)
+        return ShellFailure(job.source, "no-record",
+                            "what there is to say about it cannot be kept (is there a limit on the size of "
+                            "files?)");
+    const std::string cause = WIFSIGNALED(end.status)
+                                  ? std::string(strsignal(WTERMSIG(end.status)))
+                                  : "exit code " + std::to_string(WEXITSTATUS(end.status));
+    return ShellFailure(job.source, "crashed", "the conversion crashed (" + cause + "); nothing was written");
+}
+
+void Emit(const std::string& text, std::FILE* file)
+{
+    std::fwrite(text.data(), 1, text.size(), file);
+}
+
+} // namespace
+
+CFileRun::CFileRun(const COptions& options, Jobs jobs, CRunState state)
+    : m_kOptions(options), m_kJobs(std::move(jobs)), m_kState(std::move(state)),
+      m_kBar(m_kJobs.size(), !options.quiet && !options.json)
+{
+}
+
+CFileRun::~CFileRun() = default;
+
+EExit CFileRun::RunAll()
+{
+    if (!Open())
+        return EExit::Failed;
+    const CPoolSettings settings{.workerCount = WorkerCount(m_kOptions, m_kJobs.size()),
+                                 .jobSeconds = m_kOptions.timeLimit,
+                                 .commit = m_kOptions.keepGoing ? ECommit::AtOnce : ECommit::InTurn};
+    const CInterrupt interrupt;
+    const bool ran = CWorkerPool(*this, settings).Run(m_kJobs.size(), interrupt);
+    m_kBar.Clear();
+    return Finish(ran, interrupt.Count());
+}
+
+bool CFileRun::Open()
+{
+    if (m_kOptions.resume && !OpenState())
+        return false;
+    if (!m_kOptions.dryRun && !OpenReport()) // last, because it empties what was there
+        return false;
+    if (!m_kOptions.dryRun)
+        SweepLeftovers();
+    return true;
+}
+
+bool CFileRun::OpenReport()
+{
+    if (m_kOptions.report.empty())
+        return true;
+    if (const std::optional<CReport> refusal = WhyNotReport())
+    {
+        SayReport(m_kOptions, *refusal);
+        return false;
+    }
+    if (m_kReport.Open(m_kOptions.report, CReportFile::EStart::Empty))
+        return true;
+    SayError(Printable(m_kOptions.report) + ": the report cannot be written");
+    return false;
+}
+
+std::optional<CReport> CFileRun::WhyNotReport() const
+{
+    const std::string& path = m_kOptions.report;
+    const auto isReport = [&](const std::string& other) { return IsSameFile(path, other); };
+    if (std::ranges::any_of(m_kJobs, isReport, &CConversionJob::source) ||
+        std::ranges::any_of(m_kJobs, isReport, &CConversionJob::output) || isReport(m_kOptions.filesFrom) ||
+        isReport(m_kOptions.html) || isReport(m_kOptions.profile))
+        return ShellFailure(path, "in-use",
+                            "the run reads or writes this file; name another one for the report");
+    if (m_kOptions.resume && CReportFile::IsReport(path))
+        return std::nullopt; // it says again what the first one said
+    return WhyNotWrite(m_kOptions, path);
+}
+
+bool CFileRun::OpenState()
+{
+    const CFilePlatform platform(EPlatformWriting::No, m_kOptions.dataFolder);
+    CContentHash key;
+    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(m_kOptions, ~(kHowToRun | kProfile)));
+    for (const char* file : {"base.htr", "KsBone.bsm"})
+        key.AddFile(platform.DataFolder() + file);
+    if (!AddProfiles(key)) // by what is in them, and not by a name
+        return false;
+    m_kCommonKey = key.Digits();
+    m_kResume.Read(m_kState.folder);
+    if (m_kOptions.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
+        return true;
+    SayError(Printable(m_kState.folder) + ": what is done cannot be kept here, so that --resume cannot work");
+    return false;
+}
+
+// A run that was killed had no time to.
+void CFileRun::SweepLeftovers() const
+{
+    std::set<std::string> folders;
+    for (const CConversionJob& job : m_kJobs)
+        folders.insert(FolderOf(job.output));
+    for (const std::string& folder : folders)
+        RemoveLeftovers(folder);
+}
+
+EExit CFileRun::Finish(bool ran, int requests)
+{
+    m_kTally.left = m_kJobs.size() - std::accumulate(m_kTally.ended.begin(), m_kTally.ended.end(), size_t{0});
+    if (!ran)
+        SayError("the system gives no process to work on; --jobs with a smaller number may help");
+    if (requests > 0)
+        SayError("interrupted");
+    const bool isSynced = SyncResults();
+    const bool good = TellEnd() && isSynced;
+    if (m_bReportFailed)
+        SayError(Printable(m_kOptions.report) + ": the report cannot be written to its end");
+    if (requests > 0)
+        return EExit::Interrupted;
+    return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
+}
+
+// Before anything says that the run is done. A run of one file has synced it already.
+bool CFileRun::SyncResults()
+{
+    if (m_kOptions.resume && m_kResume.HasUnsynced())
+        m_kSync.Add(m_kState.folder.empty() ? "." : m_kState.folder);
+    const std::string failed = m_kSync.Sync();
+    const bool isSynced = failed.empty();
+    if (!isSynced)
+        SayError(Printable(failed) +
+                 ": the disk reports a failed write; this result or others of the run may be "
+                 "damaged");
+    const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
+    if (isSynced && isNews && m_kOptions.resume && !m_kOptions.dryRun)
+        m_kResume.AddSynced();
+    return isSynced;
+}
+
+// In a worker.
+
+uint8_t CFileRun::Run(size_t index, std::FILE* record)
+{
+    const CConversionJob& job = m_kJobs[index];
+    CSafeFile::DeferSyncs(IsSyncDeferred());
+    if (!m_kOptions.dryRun)
+        CreateFolder(FolderOf(job.output));
+    std::string line;
+    const CFileEnd end =
+        m_kOptions.resume ? ConvertResumed(index, line) : ConvertGuarded(m_kOptions, index, line);
+    Emit(line + "}\n" + Enclosure(), record);
+    return static_cast<uint8_t>(static_cast<uint8_t>(end.outcome) | (end.endsRun ? kEndsRun : 0) |
+                                (end.abandons ? kAbandons : 0));
+}
+
+CFileRun::CFileEnd CFileRun::ConvertGuarded(const COptions& options, size_t index, std::string& line)
+{
+    const auto start = std::chrono::steady_clock::now();
+    CTextFile text;
+    CFileEnd end{.endsRun = !options.keepGoing};
+    try
+    {
+        if (FolderExists(m_kJobs[index].source)) // in a tree, what cannot be listed stands for its files
+            TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
+        else
+            end = Convert(options, index, text.File());
+    } catch (const std::bad_alloc&)
+    {
+        TellLost(index, ShellFailure(m_kJobs[index].source, "memory", "there is not enough memory for this"),
+                 text.File());
+    }
+    const std::chrono::duration<double> seconds = std::chrono::steady_clock::now() - start;
+    line = Timed(text.Text(), seconds.count());
+    return end;
+}
+
+CFileRun::CFileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
+{
+    const CConversionJob& job = m_kJobs[index];
+    const std::string name = NameInState(job);
+    const std::string key = KeyOf(job);
+    const std::string head = RecordHead(job);
+    const std::string digits = FileDigits(job.output);
+    if (const std::string* told = m_kResume.FindTold(name, key, digits))
+    {
+        TellUpToDate(index);
+        line = head + *told + ",\"resumed\":true";
+        return {.outcome = EConversion::Skipped};
+    }
+    COptions options = m_kOptions;
+    if (!options.force && m_kResume.Knows(name) && FileExists(job.output))
+    {
+        if (!m_kResume.IsOwn(name, digits, ModificationDigits(job.output)))
+            return KeepChanged(index, line);
+        options.force = true;
+    }
+    const CFileEnd end = ConvertGuarded(options, index, line);
+    if (end.outcome == EConversion::Converted)
+        m_kResume.AddMade(name, key, m_kReadyDigits, m_kReadyModified,
+                          line.substr(std::min(head.size(), line.size())));
+    return end;
+}
+
+CFileRun::CFileEnd CFileRun::KeepChanged(size_t index, std::string& line)
+{
+    CTextFile text;
+    TellLost(index,
+             ShellFailure(m_kJobs[index].output, "changed",
+                          "this file was changed after the run made it, and was kept; --force replaces it"),
+             text.File());
+    line = Timed(text.Text(), 0.0);
+    return {.endsRun = !m_kOptions.keepGoing};
+}
+
+void CFileRun::Ready(size_t index, const std::string& privatePath)
+{
+    if (!m_kOptions.resume)
+        return;
+    m_kReadyDigits = FileDigits(privatePath);
+    m_kReadyModified = ModificationDigits(privatePath);
+    m_kResume.AddReady(NameInState(m_kJobs[index]), m_kReadyDigits, m_kReadyModified);
+}
+
+std::string CFileRun::KeyOf(const CConversionJob& job) const
+{
+    return CContentHash().AddText(m_kCommonKey).AddText(NameInState(job)).AddFile(job.source).Digits();
+}
+
+// The same from wherever the run is started.
+std::string CFileRun::NameInState(const CConversionJob& job) const
+{
+    return job.output.starts_with(m_kState.folder) ? job.output.substr(m_kState.folder.size()) : job.output;
+}
+
+// In the program.
+
+void CFileRun::Lost(size_t index)
+{
+    RemoveLeftovers(FolderOf(m_kJobs[index].output));
+}
+
+bool CFileRun::Take(size_t index, const CJobEnd& end)
+{
+    m_kBar.Clear();
+    Emit(end.words, stderr);
+    Emit(end.output, stdout);
+    const bool lost = end.kind != CJobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
+    const std::string record = lost ? TakeLost(index, end) : end.record;
+    std::fflush(stdout);
+    const auto outcome = lost ? EConversion::Failed : static_cast<EConversion>(end.answer & kOutcomeBits);
+    ++m_kTally[outcome];
+    if (outcome == EConversion::Converted && IsSyncDeferred())
+        m_kSync.Add(m_kJobs[index].output);
+    m_bAbandoned = m_bAbandoned || (end.answer & kAbandons) != 0;
+    std::string_view enclosure = record;
+    std::string_view line;
+    NextLine(enclosure, line);
+    AddToReport(line);
+    TakeRecord(index, outcome, line, enclosure);
+    return lost ? m_kOptions.keepGoing : (end.answer & kEndsRun) == 0;
+}
+
+std::string CFileRun::TakeLost(size_t index, const CJobEnd& end)
+{
+    CTextFile text;
+    TellLost(index, LostReport(m_kJobs[index], end, m_kOptions.timeLimit), text.File());
+    return Timed(text.Text(), end.seconds) + "}\n";
+}
+
+void CFileRun::AddToReport(std::string_view line)
+{
+    if (m_kReport.IsOpen() && !m_kReport.AddLine(line))
+        m_bReportFailed = true;
+}
+
+void CFileRun::Tick(size_t ended)
+{
+    m_kBar.Show(ended, m_kTally[EConversion::Failed]);
+}
+
+} // namespace gw
