@@ -48,7 +48,7 @@ TEST(CKeyArray, HoldsWhatAVectorWouldAndOneKeyWhileAllAreEqual)
     {
         CKeyArray<Vec3> keys;
         std::vector<Vec3> plain;
-        const unsigned choice = random() % 3; // how many values there are
+        const auto choice = static_cast<unsigned>(random() % 3); // how many values there are
         const auto next = [&] {
             return Vec3{0.0f, random() % 2 ? 0.0f : -0.0f, static_cast<float>(random() % (choice + 1))};
         };
