@@ -5,6 +5,7 @@
 #include "CBoneMesh.h"
 #include "CPoseSampler.h"
 #include "CRetargeter.h"
+#include "HostBones.h"
 #include "Skeleton.h"
 
 #include <unordered_map>
@@ -12,9 +13,6 @@
 namespace gw {
 
 namespace {
-
-constexpr const char* kCollars[] = {"LCollar", "RCollar"};
-constexpr const char* kHipBones[] = {"LPelvis", "RPelvis"};
 
 class CBoneAimer
 {
@@ -84,8 +82,8 @@ bool CBoneAimer::LiesInTrunk(const CNode* source) const
 void CBoneAimer::TakeSpine()
 {
     const std::vector<CNode*>& spine = m_kSource.body.spine;
-    Row* const torso = RowOf("UpperTorso");
-    Row* const waist = RowOf("Waist");
+    Row* const torso = RowOf(kTorsoBone);
+    Row* const waist = RowOf(kWaistBone);
     if (!torso || !waist || !torso->source || LiesInTrunk(torso->source) || spine.empty())
         return;
     torso->source = spine.back();
@@ -96,10 +94,10 @@ void CBoneAimer::TakeSpine()
 // Left to itself a collar would share the upper arm's turn, from a frame that lies across its own.
 void CBoneAimer::TakeCollars()
 {
-    const Row* const torso = RowOf("UpperTorso");
-    for (const char* name : kCollars)
+    const Row* const torso = RowOf(kTorsoBone);
+    for (const HostSide& side : kHostSides)
     {
-        Row* const collar = RowOf(name);
+        Row* const collar = RowOf(side.collar);
         if (collar && torso && !collar->source && !collar->fixed)
             collar->source = torso->source;
     }
@@ -108,9 +106,9 @@ void CBoneAimer::TakeCollars()
 // Legs hang on the pelvis, which need not lie as the bone from hip to spine does.
 void CBoneAimer::TakePelvis()
 {
-    for (const char* name : kHipBones)
+    for (const HostSide& side : kHostSides)
     {
-        Row* const bone = RowOf(name);
+        Row* const bone = RowOf(side.pelvis);
         if (!bone || bone->source)
             continue;
         bone->fixed = false;

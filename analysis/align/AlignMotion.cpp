@@ -5,13 +5,14 @@
 
 #include "AlignMotion.h"
 
+#include "BodyTree.h"
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "CMotionSampler.h"
+#include "Directions.h"
 #include "MotionNode.h"
 #include "TKBVHStream.h"
-#include "Turns.h"
 
 #include <algorithm>
 #include <cmath>
@@ -28,14 +29,6 @@ constexpr double kSameRepeated = 0.01;
 Vec3 Scaled(const Vec3& v, const Vec3& scale)
 {
     return {v.x * scale.x, v.y * scale.y, v.z * scale.z};
-}
-
-size_t ChildJoints(const CNode& node)
-{
-    size_t count = 0;
-    for (size_t i = 0; i < node.GetChildCount(); ++i)
-        count += RecordCast<CNode>(node.ChildAt(i)) ? 1 : 0;
-    return count;
 }
 
 class CMotionAligner
@@ -98,7 +91,7 @@ void CMotionAligner::AddBone(const JointAlignment& joint, CNode& node)
     const CBoneMesh* const old = FindBoneMesh(*joint.node);
     if (!old)
         return;
-    const size_t children = ChildJoints(*joint.node);
+    const size_t children = ChildNodes(*joint.node).size();
     const Vec3 end = Turned(NodeBoneEnd(*joint.node), joint.turn);
     CBoneMesh& mesh = AttachBone(node, std::string(node.NameView()), children, old->m_fLength);
     mesh.m_kEnd = children == 0 || old->m_kEnd != kVec3Zero ? end : kVec3Zero;

@@ -6,8 +6,8 @@
 #include "CBoneMesh.h"
 #include "CReferencePose.h"
 #include "CTreePoser.h"
+#include "Directions.h"
 #include "TKBVHStream.h"
-#include "Turns.h"
 
 #include <algorithm>
 #include <cmath>

@@ -3,7 +3,7 @@
 #include "Alignment.h"
 #include "BodyPose.h"
 #include "CPoseSampler.h"
-#include "Turns.h"
+#include "Directions.h"
 
 #include <algorithm>
 #include <cmath>
@@ -20,6 +20,58 @@ int FrameStep(const BodyMotion& motion)
         return 1;
     const double step = std::floor(kSampleSeconds / static_cast<double>(motion.frequency) + 0.01);
     return static_cast<int>(std::clamp(step, 1.0, std::max(1.0, motion.frameCount / 30.0)));
+}
+
+// What the parts of a body weigh when a reference pose is looked for.
+constexpr double kFootWeight = 0.5;
+constexpr double kElbowWeight = 0.3;
+constexpr double kArmWeight = 0.2;
+
+class CWeighedError
+{
+public:
+    void Add(double degrees, double weight = 1.0)
+    {
+        m_fSum += weight * degrees * degrees;
+        m_fWeight += weight;
+    }
+    double Mean() const { return m_fWeight > 0.0 ? std::sqrt(m_fSum / m_fWeight) : 0.0; }
+
+private:
+    double m_fSum = 0.0;
+    double m_fWeight = 0.0;
+};
+
+void AddArm(const BodyArm& arm, const Vec3& up, const Vec3& sideways, CWeighedError& error)
+{
+    if (!arm.upperArm || !arm.forearm)
+        return;
+    const Vec3 upper = WayTo(arm.upperArm, arm.forearm);
+    error.Add(std::min(AngleBetween(upper, -up), AngleBetween(upper, sideways)), kArmWeight);
+    if (arm.hand)
+        error.Add(AngleBetween(upper, WayTo(arm.forearm, arm.hand)), kElbowWeight);
+}
+
+// Degrees by which a body strays from standing upright and straight, its limbs weighed by what they tell
+// about a reference pose: legs down, shoulders over the hips, arms straight and down or sideways.
+double StanceError(const CBodyMap& body, const Vec3& up)
+{
+    CWeighedError error;
+    const Vec3 left = Across(HipLine(body), up);
+    const Vec3 facing = Vec3Cross(left, up);
+    error.Add(AngleBetween(WayTo(body.hip, TrunkTop(body)), up));
+    if (const Vec3 shoulders = ShoulderLine(body); shoulders != kVec3Zero)
+        error.Add(AngleBetween(shoulders, left));
+    for (const EBodySide side : kBodySides)
+    {
+        const BodyLeg& leg = body.Leg(side);
+        error.Add(AngleBetween(WayTo(leg.thigh, leg.shin), -up));
+        error.Add(AngleBetween(WayTo(leg.shin, leg.foot), -up));
+        if (const Vec3 ahead = Across(WayTo(leg.foot, leg.toe), up); ahead != kVec3Zero)
+            error.Add(AngleBetween(ahead, facing), kFootWeight);
+        AddArm(body.Arm(side), up, side == EBodySide::Left ? left : -left, error);
+    }
+    return error.Mean();
 }
 
 void WatchBody(const CBodyMap& body, CPoseSampler& sampler)

@@ -2,23 +2,10 @@
 
 #include "BodyPose.h"
 #include "BoneMeshQueries.h"
-#include "Turns.h"
+#include "Directions.h"
+#include "JointSteps.h"
 
 namespace gw {
-
-namespace {
-
-CNode* FirstChild(const CNode& node)
-{
-    for (size_t i = 0; i < node.GetChildCount(); ++i)
-    {
-        if (CNode* child = RecordCast<CNode>(node.ChildAt(i)))
-            return child;
-    }
-    return nullptr;
-}
-
-} // namespace
 
 CReferencePose::CReferencePose(const CBodyMap& body, const Vec3& upAxis)
     : up(upAxis), hips(TurnUpright(up, HipLine(body))), trunk(hips), legLength(LegLength(body))
@@ -32,7 +19,7 @@ Vec3 ReachOf(const CNode& joint, double apart)
 {
     const Vec3 from = PlaceOf(joint);
     const CNode* last = &joint;
-    for (const CNode* below = FirstChild(joint); below; below = FirstChild(*below))
+    for (const CNode* below = NextBelow(joint, nullptr); below; below = NextBelow(*below, nullptr))
     {
         if (Vec3Length(PlaceOf(*below) - from) > apart)
             return PlaceOf(*below) - from;

@@ -22,7 +22,7 @@ struct CReferencePose
 inline constexpr double kApart = 0.005;
 
 /// Where the bone of a joint leads in the present pose: to the first joint below that lies apart by a
-/// length, by the way of first children, else to the bone's end. Zero where there is neither.
+/// length, else to the bone's end. Zero where there is neither.
 Vec3 ReachOf(const CNode& joint, double apart);
 
 } // namespace gw

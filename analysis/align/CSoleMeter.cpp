@@ -1,8 +1,8 @@
 #include "CSoleMeter.h"
 
 #include "BodyPose.h"
+#include "Directions.h"
 #include "FindContacts.h"
-#include "Turns.h"
 
 #include <algorithm>
 

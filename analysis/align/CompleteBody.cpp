@@ -1,8 +1,7 @@
 #include "CompleteBody.h"
 
+#include "BodyTree.h"
 #include "CPoseSampler.h"
-
-#include <algorithm>
 
 namespace gw {
 
@@ -13,10 +12,9 @@ CNode* FarthestChild(const CNode* joint)
 {
     CNode* farthest = nullptr;
     double distance = 0.0;
-    for (size_t i = 0; joint && i < joint->GetChildCount(); ++i)
+    for (CNode* child : joint ? ChildNodes(*joint) : std::vector<CNode*>())
     {
-        CNode* const child = RecordCast<CNode>(joint->ChildAt(i));
-        const double length = child ? Vec3Length(RestLocal(*child).Translation()) : 0.0;
+        const double length = Vec3Length(RestLocal(*child).Translation());
         if (length <= distance)
             continue;
         farthest = child;
@@ -30,22 +28,14 @@ void CompleteSpine(CBodyMap& body)
 {
     if (!body.spine.empty() || !body.neck.empty() || body.head)
         return;
-    std::vector<CNode*> spine;
     for (const BodyArm& arm : body.arms)
     {
         const CNode* const shoulder = arm.clavicle ? arm.clavicle : arm.upperArm;
-        for (CNode* joint = shoulder ? shoulder->GetParentNode() : nullptr; joint;
-             joint = joint->GetParentNode())
+        if (shoulder != body.hip && IsAtOrBelow(shoulder, body.hip))
         {
-            if (joint == body.hip)
-            {
-                std::ranges::reverse(spine);
-                body.spine = std::move(spine);
-                return;
-            }
-            spine.push_back(joint);
+            body.spine = NodesBetween(body.hip, shoulder);
+            return;
         }
-        spine.clear();
     }
 }
 

@@ -2,9 +2,10 @@
 
 #include "Angles.h"
 #include "BodyPose.h"
+#include "BodyTree.h"
 #include "BoneMeshQueries.h"
 #include "CReferencePose.h"
-#include "Turns.h"
+#include "Directions.h"
 
 #include <algorithm>
 #include <cmath>
@@ -20,23 +21,13 @@ constexpr double kSlope = 25.0;
 constexpr double kLeastSlope = 5.0;
 constexpr double kMostSlope = 50.0;
 
-CNode* NextDown(const CNode& joint)
-{
-    for (size_t i = 0; i < joint.GetChildCount(); ++i)
-    {
-        if (CNode* child = RecordCast<CNode>(joint.ChildAt(i)))
-            return child;
-    }
-    return nullptr;
-}
-
 // Where a foot may lead to, from its toe on outward.
 std::vector<Vec3> WaysAhead(const BodyLeg& leg)
 {
     std::vector<Vec3> ways;
     const Vec3 ankle = PlaceOf(*leg.foot);
     const CNode* last = leg.foot;
-    for (const CNode* joint = leg.toe ? leg.toe : NextDown(*leg.foot); joint; joint = NextDown(*joint))
+    for (const CNode* joint = leg.toe ? leg.toe : FirstChild(*leg.foot); joint; joint = FirstChild(*joint))
     {
         ways.push_back(PlaceOf(*joint) - ankle);
         last = joint;

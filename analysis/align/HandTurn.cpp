@@ -1,8 +1,9 @@
 #include "HandTurn.h"
 
 #include "BodyPose.h"
+#include "BodyTree.h"
 #include "CReferencePose.h"
-#include "Turns.h"
+#include "Directions.h"
 
 #include <algorithm>
 
@@ -18,11 +19,8 @@ constexpr double kLeastPalm = 0.02;   // of a leg, from knuckle to knuckle
 std::vector<Vec3> FingerWays(const CNode& hand, double apart)
 {
     std::vector<Vec3> ways;
-    for (size_t i = 0; i < hand.GetChildCount(); ++i)
+    for (const CNode* finger : ChildNodes(hand))
     {
-        const CNode* const finger = RecordCast<CNode>(hand.ChildAt(i));
-        if (!finger)
-            continue;
         Vec3 way = PlaceOf(*finger) - PlaceOf(hand);
         if (Vec3Length(way) <= apart)
             way = way + ReachOf(*finger, apart);

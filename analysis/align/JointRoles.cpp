@@ -1,5 +1,6 @@
 #include "JointRoles.h"
 
+#include "BodyTree.h"
 #include "CTreePoser.h"
 
 #include <span>
@@ -40,13 +41,6 @@ private:
     std::vector<JointRole> m_kRoles;
 };
 
-bool IsUnder(const CNode* joint, const CNode* ancestor)
-{
-    while (joint && joint != ancestor)
-        joint = joint->GetParentNode();
-    return joint != nullptr;
-}
-
 // Joints that are missing are passed over.
 void CRoleFinder::AddChain(std::span<const Stop> chain, EBodySide side)
 {
@@ -60,7 +54,7 @@ void CRoleFinder::AddChain(std::span<const Stop> chain, EBodySide side)
     {
         const auto& [joint, part] = stops[i];
         CNode* next = i + 1 < stops.size() ? stops[i + 1].joint : nullptr;
-        next = IsUnder(next, joint) && next != joint ? next : nullptr;
+        next = IsAtOrBelow(next, joint) && next != joint ? next : nullptr;
         const EBodyPart between = part == EBodyPart::Hip ? EBodyPart::Spine : part;
         while (next && next->GetParentNode() != joint)
         {

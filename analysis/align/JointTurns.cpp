@@ -10,9 +10,9 @@
 #include "CMotionEvidence.h"
 #include "CReferencePose.h"
 #include "CTreePoser.h"
+#include "Directions.h"
 #include "FootTurn.h"
 #include "HandTurn.h"
-#include "Turns.h"
 
 #include <cmath>
 

@@ -1,12 +1,14 @@
 #include "AlignNeeds.h"
 #include "Alignment.h"
 #include "BodyPose.h"
+#include "BodyStance.h"
 #include "CMotionEvidence.h"
 #include "CReferencePose.h"
 #include "CTreePoser.h"
+#include "Directions.h"
 #include "DoubledOffsets.h"
 #include "JointTurns.h"
-#include "Turns.h"
+#include "Skeleton.h"
 #include "WorldUp.h"
 
 #include <cmath>
@@ -21,16 +23,11 @@ bool HasBody(const BodyMotion& motion)
            motion.body.Leg(EBodySide::Left).thigh && motion.body.Leg(EBodySide::Right).thigh;
 }
 
-std::string AxisName(const Vec3& axis)
-{
-    const bool minus = axis.x + axis.y + axis.z < 0.0f;
-    return std::string(minus ? "-" : "") + (axis.x != 0.0f ? "X" : axis.y != 0.0f ? "Y" : "Z");
-}
-
 void ReportUp(const Vec3& up, AlignReport& report)
 {
     if (up != kVec3UnitY)
-        report.findings.push_back({EAlignNeed::UpAxis, AxisName(up), AngleBetween(up, kVec3UnitY)});
+        report.findings.push_back(
+            {EAlignNeed::UpAxis, std::string(AxisName(up)), AngleBetween(up, kVec3UnitY)});
 }
 
 void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& doubled, AlignReport& report)
@@ -40,6 +37,19 @@ void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& d
         if (doubled[i])
             report.findings.push_back({EAlignNeed::DoubledPositions, std::string(joints[i]->NameView())});
     }
+}
+
+// Whether a rest pose tells how bones are turned: legs along the trunk, shoulders and feet facing as the hips
+// do. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside the bones' real ends.
+bool IsReference(const BodyStance& stance)
+{
+    constexpr double kTrunkLimit = 40.0;
+    constexpr double kLegLimit = 40.0;
+    constexpr double kShoulderLimit = 35.0;
+    constexpr double kFootLimit = 70.0;
+    return stance.left != kVec3Zero && AngleBetween(stance.up, NearestAxis(stance.up)) < kTrunkLimit &&
+           stance.thighs.value_or(180.0) < kLegLimit && stance.shins.value_or(180.0) < kLegLimit &&
+           stance.shoulders.value_or(0.0) < kShoulderLimit && stance.feet < kFootLimit;
 }
 
 // Joints of the trunk that stand where the next one stands: they turn nothing but what is above that.
@@ -91,7 +101,7 @@ class CAlignmentPlanner
 {
 public:
     CAlignmentPlanner(const BodyMotion& motion, Alignment& alignment)
-        : m_kMotion(motion), m_kAlignment(alignment), m_kTree(*motion.root, motion.frequency),
+        : m_kMotion(motion), m_kAlignment(alignment), m_kTree(NodesOf(*motion.root), motion.frequency),
           m_kRoles(FindRoles(m_kTree, motion.body))
     {
     }
@@ -119,7 +129,9 @@ void CAlignmentPlanner::LookAtRest()
     const double leg = LegLength(m_kMotion.body);
     m_kAlignment.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
     m_kWays = FindLooseWays(m_kTree, m_kRoles, leg);
-    m_bIsRest = FindStance(m_kMotion.body, m_kUp) || m_kMotion.frameCount <= 0;
+    const BodyStance stance = RestStanceOf(m_kMotion.body);
+    m_kUp = NearestAxis(stance.up);
+    m_bIsRest = IsReference(stance) || m_kMotion.frameCount <= 0;
 }
 
 void CAlignmentPlanner::FindUp()

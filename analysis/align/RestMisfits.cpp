@@ -5,8 +5,9 @@
 #include "CPoseMatcher.h"
 #include "CPoseSampler.h"
 #include "CRetargeter.h"
+#include "Directions.h"
+#include "HostBones.h"
 #include "Skeleton.h"
-#include "Turns.h"
 
 namespace gw {
 
@@ -20,16 +21,16 @@ struct BoneRow
     bool planted; ///< planting lays it along the source's, so that the turn about it is all that counts
 };
 constexpr BoneRow kBones[] = {
-    {"UpperTorso", false},
-    {"Neck",       false},
-    {"LUpperArm",  false},
-    {"LForearm",   false},
-    {"RUpperArm",  false},
-    {"RForearm",   false},
-    {"LThigh",     true },
-    {"LCalf",      true },
-    {"RThigh",     true },
-    {"RCalf",      true },
+    {kTorsoBone,           false},
+    {kNeckBone,            false},
+    {kLeftBones.upperArm,  false},
+    {kLeftBones.forearm,   false},
+    {kRightBones.upperArm, false},
+    {kRightBones.forearm,  false},
+    {kLeftBones.thigh,     true },
+    {kLeftBones.calf,      true },
+    {kRightBones.thigh,    true },
+    {kRightBones.calf,     true },
 };
 
 Mat3 RestBone(const CNode& source)

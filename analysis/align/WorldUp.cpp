@@ -3,6 +3,7 @@
 #include "Alignment.h"
 #include "BodyPose.h"
 #include "CPoseSampler.h"
+#include "Directions.h"
 
 #include <algorithm>
 #include <cmath>

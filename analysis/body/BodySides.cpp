@@ -1,7 +1,7 @@
 #include "BodySides.h"
 
-#include "CBodyMap.h"
 #include "CJointTree.h"
+#include "Directions.h"
 
 #include <algorithm>
 #include <cmath>
@@ -22,12 +22,6 @@ constexpr double kSureAtRest =
 // What the two say weighs differently: a knee is never bent the other way, but may turn outward.
 constexpr float kKneeWeight = 0.7f;
 
-// The part of a vector that is square to a unit axis.
-Vec3 Square(const Vec3& v, const Vec3& axis)
-{
-    return v - axis * static_cast<float>(Vec3Dot(v, axis));
-}
-
 class CPose
 {
 public:
@@ -44,7 +38,7 @@ public:
         if (leg.ankle < 0)
             return kVec3Zero;
         const Vec3& end = m_kTree.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
-        const Vec3 part = Square(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
+        const Vec3 part = Across(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
         return Vec3Length(part) > kFootLeast ? Vec3Normalized(part) : kVec3Zero;
     }
     // Where a knee goes when it bends, longer for a greater bend up to 1.
@@ -52,7 +46,7 @@ public:
     {
         const Vec3 ankle = leg.ankle >= 0 ? Place(leg.ankle) : m_kTree.Stances().Tip(m_uiStance, leg.knee);
         const Vec3 line = Vec3Normalized(ankle - Place(leg.thigh));
-        const Vec3 part = Square(Direction(leg.thigh, leg.knee), line);
+        const Vec3 part = Across(Direction(leg.thigh, leg.knee), line);
         const double sine = Vec3Length(part);
         if (sine < kKneeLeast)
             return kVec3Zero;
@@ -93,12 +87,34 @@ bool IsWhole(const LegsOfBody& body)
            std::ranges::all_of(body.legs, [](const Leg& leg) { return leg.thigh >= 0 && leg.knee >= 0; });
 }
 
+// Whether a body stands is asked of every profile that may fit; arms and feet say nothing of it.
+bool StandsAtRest(const CJointTree& tree, const CBodyMap& body)
+{
+    CBodyMap part;
+    part.hip = body.hip;
+    part.head = body.head;
+    if (!body.head)
+        part.spine = body.spine;
+    for (const EBodySide side : kBodySides)
+        part.Leg(side) = {body.Leg(side).thigh, body.Leg(side).shin, nullptr, nullptr};
+    return StanceIn(tree, 0, part).Stands();
+}
+
 } // namespace
+
+BodyStance StanceIn(const CJointTree& tree, size_t stance, const CBodyMap& body)
+{
+    return StanceOf(body, [&](const CNode& joint) {
+        const int index = tree.IndexOf(&joint);
+        return index < 0 ? kVec3Zero : tree.Stances().Place(stance, index);
+    });
+}
 
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body)
 {
     CNode* const chest = body.spine.empty() ? nullptr : body.spine.back();
-    LegsOfBody legs{tree.IndexOf(body.hip), tree.IndexOf(body.head ? body.head : chest), {}};
+    LegsOfBody legs{
+        tree.IndexOf(body.hip), tree.IndexOf(body.head ? body.head : chest), {}, StandsAtRest(tree, body)};
     for (const EBodySide side : kBodySides)
     {
         const BodyLeg& leg = body.Leg(side);
@@ -121,7 +137,7 @@ double JudgeSides(const CJointTree& tree, const LegsOfBody& body)
     const auto byFeet = [&](const CPose& pose) { return leftward(pose, pose.FeetForward(body)); };
     const auto byKnees = [&](const CPose& pose) { return leftward(pose, pose.KneesForward(body)); };
     // Nobody twists the hips in a rest pose that is a stance.
-    const double atRest = IsStance(tree, 0, body) ? byFeet(CPose(tree, 0)) : 0.0;
+    const double atRest = body.standsAtRest ? byFeet(CPose(tree, 0)) : 0.0;
     if (std::fabs(atRest) > kSureAtRest)
         return std::copysign(1.0, atRest);
     const double feet = MeanOfPoses(tree, byFeet);
@@ -135,29 +151,8 @@ double JudgeAlong(const CJointTree& tree, const LegsOfBody& body, int first, int
     const auto along = [&](const CPose& pose) {
         return Vec3Dot(pose.Direction(second, first), pose.Sideways(body));
     };
-    const double atRest = IsStance(tree, 0, body) ? along(CPose(tree, 0)) : 0.0;
+    const double atRest = body.standsAtRest ? along(CPose(tree, 0)) : 0.0;
     return std::fabs(atRest) > kAlongAtRest ? std::copysign(1.0, atRest) : MeanOfPoses(tree, along);
-}
-
-bool IsStance(const CJointTree& tree, size_t stance, const LegsOfBody& body)
-{
-    constexpr double kAway = -0.7;  // cosine of the angle between leg and trunk: 45 degrees from straight
-    constexpr double kBeside = 0.8; // and between the legs
-    if (!IsWhole(body))
-        return false;
-    const CPose pose(tree, stance);
-    const Vec3 left = pose.Direction(body.legs[0].thigh, body.legs[0].knee);
-    const Vec3 right = pose.Direction(body.legs[1].thigh, body.legs[1].knee);
-    const Vec3 up = pose.Up(body);
-    return Vec3Dot(left, up) < kAway && Vec3Dot(right, up) < kAway && Vec3Dot(left, right) > kBeside;
-}
-
-BodyAxes AxesOf(const CJointTree& tree, size_t stance, const LegsOfBody& body)
-{
-    const CPose pose(tree, stance);
-    const Vec3 up = pose.Up(body);
-    const Vec3 left = Vec3Normalized(Square(pose.Sideways(body), up));
-    return {up, Vec3Cross(left, up), left};
 }
 
 } // namespace gw

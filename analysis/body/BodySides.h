@@ -1,23 +1,12 @@
 #pragma once
 
-#include "Vec3.h"
+#include "BodyStance.h"
 
 #include <array>
-#include <cstddef>
-#include <vector>
 
 namespace gw {
 
 class CJointTree;
-struct CBodyMap;
-
-/// The axes of a body in one pose: unit vectors, world space.
-struct BodyAxes
-{
-    Vec3 up;      ///< from the hip towards the chest
-    Vec3 forward; ///< where feet or knees point, level
-    Vec3 left;    ///< up x forward
-};
 
 /// The joints of two legs and of the trunk's ends, by index; -1 for what is not there.
 struct LegsOfBody
@@ -32,8 +21,12 @@ struct LegsOfBody
     int hip = -1;
     int chest = -1;          ///< or the head, where there is one
     std::array<Leg, 2> legs; ///< the left one first, as far as is known
+    bool standsAtRest = false;
 };
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body);
+
+/// The stance in a pose of a tree.
+BodyStance StanceIn(const CJointTree& tree, size_t stance, const CBodyMap& body);
 
 /// How surely the first leg is the left one, -1 to 1, by up x forward: forward is where the feet point, else
 /// where the knees bend to. A mean over all poses that say something; below 0 the second leg is the left one.
@@ -42,11 +35,5 @@ double JudgeSides(const CJointTree& tree, const LegsOfBody& body);
 
 /// The same for a pair of joints that should lie to the same sides as the thighs.
 double JudgeAlong(const CJointTree& tree, const LegsOfBody& body, int first, int second);
-
-/// Whether somebody could stand so: legs away from the chest and side by side.
-bool IsStance(const CJointTree& tree, size_t stance, const LegsOfBody& body);
-
-/// The axes of a body whose left and right are right.
-BodyAxes AxesOf(const CJointTree& tree, size_t stance, const LegsOfBody& body);
 
 } // namespace gw

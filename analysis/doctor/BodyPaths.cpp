@@ -1,20 +1,13 @@
 #include "BodyPaths.h"
 
-#include "AlongAxis.h"
+#include "BodyPose.h"
 #include "CMotionFile.h"
 #include "CPoseSampler.h"
-
-#include <algorithm>
-#include <cmath>
+#include "Directions.h"
 
 namespace gw {
 
 namespace {
-
-Vec3 PlaceOf(const CNode& node)
-{
-    return node.m_kWorldMatrix.Translation();
-}
 
 double RestDistance(const CNode& a, const CNode& b)
 {
@@ -42,16 +35,12 @@ BodyPaths FollowBody(const CMotionFile& motion, const CBodyMap& body)
     return paths;
 }
 
-UpAxis FindUpAxis(const BodyPaths& paths)
+Vec3 FindUpAxis(const BodyPaths& paths)
 {
     Vec3 sum = kVec3Zero;
     for (size_t frame = 0; frame < paths.FrameCount(); ++frame)
         sum = sum + paths.hip[frame] * 2.0f - paths.feet[0][frame] - paths.feet[1][frame];
-    const auto isLess = [&](size_t a, size_t b) {
-        return std::fabs(AlongAxis(sum, a)) < std::fabs(AlongAxis(sum, b));
-    };
-    const size_t axis = std::max({size_t{1}, size_t{0}, size_t{2}}, isLess);
-    return {axis, AlongAxis(sum, axis) < 0.0f};
+    return NearestAxis(sum);
 }
 
 double RestLegLength(const CBodyMap& body)

@@ -23,15 +23,9 @@ struct BodyPaths
 /// The paths of a body with a hip and both feet; none for one without. Leaves the tree posed.
 BodyPaths FollowBody(const CMotionFile& motion, const CBodyMap& body);
 
-/// The axis along which the hip stands over the feet: 0 X, 1 Y, 2 Z.
-struct UpAxis
-{
-    size_t axis = 1;
-    bool negative = false;
-};
-
-/// Which way is up over the whole motion. Y where there are no frames.
-UpAxis FindUpAxis(const BodyPaths& paths);
+/// The world axis, plus or minus, along which the hip stands over the feet in the whole motion. +Y where
+/// there are no frames.
+Vec3 FindUpAxis(const BodyPaths& paths);
 
 /// Thigh and shin in the rest pose, the mean of both legs; 0 where a joint of them is not known.
 double RestLegLength(const CBodyMap& body);

@@ -2,10 +2,13 @@
 
 #include "BVHOutline.h"
 #include "BodyPaths.h"
+#include "BodyTree.h"
 #include "CFindings.h"
 #include "CKeyframeControl.h"
 #include "CMotionFile.h"
+#include "CPoseSampler.h"
 #include "CheckBody.h"
+#include "Directions.h"
 #include "FindBody.h"
 #include "FindBodyByNames.h"
 #include "GaitRate.h"
@@ -20,16 +23,6 @@ namespace gw {
 namespace {
 
 constexpr double kLeastTravelShare = 0.1; // of the longest bone: what a joint below a still root must move
-
-constexpr std::string_view kUpNames[2][3] = {
-    {"X",  "Y",  "Z" },
-    {"-X", "-Y", "-Z"},
-};
-
-const CKeyframeControl* TrackOf(const CNode& node)
-{
-    return RecordCast<CKeyframeControl>(node.GetControl());
-}
 
 // The largest distance from the first position that a track has.
 double Travel(const CKeyframeControl& track)
@@ -73,10 +66,9 @@ public:
         if (!track || !StandsStill(*track))
             return;
         const double least = kLeastTravelShare * LongestBone(NodesOf(m_kRoot));
-        for (size_t i = 0; i < m_kRoot.GetChildCount(); ++i)
+        for (const CNode* child : ChildNodes(m_kRoot))
         {
-            const CNode* const child = RecordCast<CNode>(m_kRoot.ChildAt(i));
-            const CKeyframeControl* const below = child ? TrackOf(*child) : nullptr;
+            const CKeyframeControl* const below = TrackOf(*child);
             if (below && least > 0.0 && Travel(*below) >= least)
                 return Add(EFault::StillRoot, m_kRoot);
         }
@@ -94,7 +86,7 @@ public:
     }
 
     // A rate in place of a time needs no gait to be seen.
-    void CheckRate(const BodyPaths& paths, const UpAxis& up, const MotionFacts& facts)
+    void CheckRate(const BodyPaths& paths, const Vec3& up, const MotionFacts& facts)
     {
         const std::optional<Gait> gait = FindGait(paths, up, facts.leg);
         const double rate = 1.0 / facts.frameSeconds;
@@ -156,12 +148,13 @@ MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFi
     facts.body = SourceOf(found);
     facts.leg = RestLegLength(found.body);
     facts.unit = UnitOfLeg(facts.leg);
-    facts.restPose = RestPoseOf(found.body);
+    if (found.body.DrivesBody())
+        facts.restPose = RestStanceOf(found.body).Verdict();
     const BodyPaths paths = FollowBody(motion, found.body);
     if (paths.FrameCount() == 0)
         return facts;
-    const UpAxis up = FindUpAxis(paths);
-    facts.up = kUpNames[up.negative][up.axis];
+    const Vec3 up = FindUpAxis(paths);
+    facts.up = AxisName(up);
     check.CheckRate(paths, up, facts);
     return facts;
 }

@@ -8,7 +8,6 @@
 
 #include "GaitRate.h"
 
-#include "AlongAxis.h"
 #include "BodyPaths.h"
 
 #include <algorithm>
@@ -56,8 +55,7 @@ struct Spread
 class CStepSearch
 {
 public:
-    CStepSearch(const BodyPaths& paths, const UpAxis& up, double leg)
-        : m_kPaths(paths), m_uiUp(up.axis), m_fLeg(leg)
+    CStepSearch(const BodyPaths& paths, const Vec3& up, double leg) : m_kPaths(paths), m_kUp(up), m_fLeg(leg)
     {
         for (size_t frame = 0; frame < paths.FrameCount(); ++frame)
             m_kApart.push_back(GroundDistance(paths.feet[0][frame], paths.feet[1][frame]));
@@ -88,7 +86,7 @@ private:
     double GroundDistance(const Vec3& a, const Vec3& b) const
     {
         const Vec3 d = a - b;
-        const auto height = static_cast<double>(AlongAxis(d, m_uiUp));
+        const double height = Vec3Dot(d, m_kUp);
         return std::sqrt(std::max(Vec3Dot(d, d) - height * height, 0.0));
     }
     double Share(double share) const
@@ -140,7 +138,7 @@ private:
     }
 
     const BodyPaths& m_kPaths;
-    size_t m_uiUp;
+    Vec3 m_kUp;
     double m_fLeg;
     std::vector<double> m_kApart; // the feet, over the ground
     std::vector<size_t> m_kSteps; // frames in which they come apart
@@ -154,7 +152,7 @@ double Gait::UsualRate() const
     return framesPerStep * stepsPerMinute / 60.0;
 }
 
-std::optional<Gait> FindGait(const BodyPaths& paths, const UpAxis& up, double leg)
+std::optional<Gait> FindGait(const BodyPaths& paths, const Vec3& up, double leg)
 {
     if (!(leg > 0.0))
         return std::nullopt;

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CBodyMap.h"
+#include "BodyStance.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -9,17 +9,6 @@
 namespace gw {
 
 class CMotionFile;
-
-/// How a skeleton stands where all its rotations are 0.
-enum class ERestPose : uint8_t
-{
-    Unknown, ///< the arms or legs were not found
-    None,    ///< no stance at all: legs and torso point the same way
-    TPose,
-    APose,
-    ArmsDown,
-    Other, ///< upright, with the arms somewhere else
-};
 
 /// How the joints of a body were found.
 enum class EBodySource : uint8_t
@@ -44,11 +33,6 @@ struct MotionFacts
 
 /// The unit in which a leg of an adult or of a child has that length, or empty.
 std::string_view UnitOfLeg(double leg);
-/// How a body stands at rest.
-ERestPose RestPoseOf(const CBodyMap& body);
-
-/// "T-pose"; "unknown" where it is.
-std::string_view RestPoseName(ERestPose pose);
 /// "names", "shape" or "none".
 std::string_view BodySourceName(EBodySource source);
 

@@ -2,6 +2,7 @@
 
 #include "Angles.h"
 #include "CPoseMatcher.h"
+#include "Directions.h"
 #include "Euler.h"
 
 #include <algorithm>
@@ -16,11 +17,6 @@ namespace {
 
 // What a degree of turn about the bone counts against one of the bone's direction.
 constexpr double kTwistWeight = 0.1;
-
-Vec3 Through(const Vec3& v, const Mat3& m)
-{
-    return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
-}
 
 // All signed permutations that are rotations, the neutral one first.
 std::vector<AxisCodes> AxisRotations()
@@ -65,38 +61,17 @@ float Size(const Degrees& angles)
     return std::fabs(angles[0]) + std::fabs(angles[1]) + std::fabs(angles[2]);
 }
 
-double DegreesApart(const Vec3& a, const Vec3& b)
-{
-    return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) / kDegreesToRadians64;
-}
-
 // How far the numbers are from a rotation, in degrees; `axis` counts for all, the other directions a little.
 double Distance(const CRowNumbers& numbers, const Mat3& rotation, const Vec3& axis)
 {
     const Mat3 offset = OffsetOf(numbers);
     double twist = 0.0;
     for (int row = 0; row < 3; ++row)
-        twist = std::max(twist, DegreesApart(offset.Row(row), rotation.Row(row)));
-    return DegreesApart(Through(axis, offset), Through(axis, rotation)) + kTwistWeight * twist;
+        twist = std::max(twist, AngleBetween(offset.Row(row), rotation.Row(row)));
+    return AngleBetween(Turned(axis, offset), Turned(axis, rotation)) + kTwistWeight * twist;
 }
 
 } // namespace
-
-Mat3 ShortestTurn(const Vec3& from, const Vec3& to)
-{
-    const Vec3 a = Vec3Normalized(from);
-    const Vec3 b = Vec3Normalized(to);
-    Vec3 axis = Vec3Cross(a, b);
-    const double sine = Vec3Length(axis);
-    const double cosine = Vec3Dot(a, b);
-    if (sine < 1e-7)
-    {
-        if (cosine >= 0.0)
-            return kMat3Identity;
-        axis = Vec3Cross(a, std::fabs(a.x) < 0.7f ? kVec3UnitX : kVec3UnitZ); // any half turn does
-    }
-    return Mat3FromAxisAngle(Vec3Normalized(axis), static_cast<float>(std::atan2(sine, cosine)));
-}
 
 Mat3 OffsetOf(const CRowNumbers& numbers)
 {

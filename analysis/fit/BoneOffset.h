@@ -6,9 +6,6 @@
 
 namespace gw {
 
-/// The rotation that takes one direction to another the short way round.
-Mat3 ShortestTurn(const Vec3& from, const Vec3& to);
-
 /// The rotation that a row's numbers put before a source bone's.
 Mat3 OffsetOf(const CRowNumbers& numbers);
 

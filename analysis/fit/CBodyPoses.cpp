@@ -11,19 +11,13 @@ namespace gw {
 namespace {
 
 constexpr size_t kFrameCount = 6;
-// Cosines against the way up: legs that go down and arms that do not go up. Who stretches his arms over his
-// head at rest was put there by his file's frames.
-constexpr double kDown = -0.7;
-constexpr double kArmsUp = 0.7;
+// Degrees from straight down. Who stretches the arms over the head at rest was put there by the file's
+// frames.
+constexpr double kArmsUp = 135.0;
 
-const CKeyframeControl* TrackOf(const CNode& node)
+bool ShowsBody(const BodyStance& rest)
 {
-    for (const CControl* control = node.GetControl(); control; control = control->GetNext())
-    {
-        if (const auto* track = dynamic_cast<const CKeyframeControl*>(control))
-            return track;
-    }
-    return nullptr;
+    return rest.Stands() && rest.armsDown && *rest.armsDown < kArmsUp;
 }
 
 float FrameTimeOf(const CNode& node)
@@ -39,7 +33,7 @@ Vec3 Middle(const Vec3& a, const Vec3& b)
 
 } // namespace
 
-CBodyPoses::CBodyPoses(const CBodyMap& body)
+CBodyPoses::CBodyPoses(const CBodyMap& body, const BodyStance& rest)
     : m_kBody(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
 {
     for (const EBodySide side : kBodySides)
@@ -47,7 +41,7 @@ CBodyPoses::CBodyPoses(const CBodyMap& body)
         Watch(body.Arm(side).upperArm);
         Watch(body.Leg(side).thigh);
     }
-    if (!StandsAtRest())
+    if (!ShowsBody(rest))
         PlanFrames();
 }
 
@@ -106,19 +100,6 @@ Mat3 CBodyPoses::Axes() const
     axes.SetRow(1, up);
     axes.SetRow(2, forward);
     return axes;
-}
-
-bool CBodyPoses::StandsAtRest() const
-{
-    const Vec3 up = Axes().Row(1);
-    const auto rise = [&](const CNode* from, const CNode* to) {
-        return from && to ? Vec3Dot(Vec3Normalized(Place(*to) - Place(*from)), up) : 0.0;
-    };
-    return std::ranges::all_of(kBodySides, [&](EBodySide side) {
-        const BodyArm& arm = m_kBody.Arm(side);
-        const BodyLeg& leg = m_kBody.Leg(side);
-        return rise(leg.thigh, leg.shin) < kDown && rise(arm.upperArm, arm.forearm) < kArmsUp;
-    });
 }
 
 } // namespace gw

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CBodyMap.h"
+#include "BodyStance.h"
 #include "CPoseSampler.h"
 #include "Mat3.h"
 #include "Mat4.h"
@@ -16,7 +16,7 @@ class CBodyPoses
 {
 public:
     /// The body has both upper arms and both thighs.
-    explicit CBodyPoses(const CBodyMap& body);
+    CBodyPoses(const CBodyMap& body, const BodyStance& rest);
     ~CBodyPoses();
     CBodyPoses(const CBodyPoses&) = delete;
     CBodyPoses& operator=(const CBodyPoses&) = delete;
@@ -43,7 +43,6 @@ private:
     };
 
     Mat4 World(const CNode& node) const;
-    bool StandsAtRest() const;
     void PlanFrames();
 
     const CBodyMap& m_kBody;

@@ -8,6 +8,7 @@
 
 #include "Angles.h"
 #include "BoneOffset.h"
+#include "Directions.h"
 #include "Euler.h"
 
 #include <cmath>
@@ -15,11 +16,6 @@
 namespace gw {
 
 namespace {
-
-Vec3 Through(const Vec3& v, const Mat3& m)
-{
-    return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
-}
 
 // Which element is the sine depends on the bone's share type: 2 for arms as they come, 1 without a share file
 // and for all other bones.
@@ -83,7 +79,7 @@ int CRowTurner::AimOf(size_t row) const
 Vec3 CRowTurner::RestAim(size_t row, int aim) const
 {
     const int joint = m_kJoints[row];
-    return Through(m_kPoses.Direction(0, joint, aim), Mat3Transpose(m_kPoses.BoneTurn(0, joint)));
+    return Turned(m_kPoses.Direction(0, joint, aim), Mat3Transpose(m_kPoses.BoneTurn(0, joint)));
 }
 
 // Where a bone should point in the reference pose; nothing where it should stand as it does at rest.
@@ -107,11 +103,11 @@ void CRowTurner::Turn(size_t row)
     const Vec3 axis = Axis(row);
     Mat3 turn = m_kTarget.RestTurn(kHostRows[row].target) * m_kFacing;
     if (const std::optional<Vec3> direction = ReferenceDirection(row, aim))
-        turn = turn * ShortestTurn(Through(axis, turn), *direction);
+        turn = turn * LeastSwing(Turned(axis, turn), *direction);
     Mat3 offset = turn * Mat3Transpose(m_kPoses.BoneTurn(m_uiReference, m_kJoints[row]));
     // A joint in between that turns by itself moves the aim; the rest pose is what counts.
     if (aim != CJointTree::kNone)
-        offset = offset * ShortestTurn(Through(axis, offset), RestAim(row, aim));
+        offset = offset * LeastSwing(Turned(axis, offset), RestAim(row, aim));
     m_kNumbers[row] = NearestOffset(offset, axis);
 }
 
@@ -120,9 +116,7 @@ std::optional<double> CRowTurner::RestError(size_t row) const
     const int aim = m_kJoints[row] == CJointTree::kNone ? CJointTree::kNone : AimOf(row);
     if (aim == CJointTree::kNone)
         return std::nullopt;
-    const Vec3 reached = Through(Axis(row), OffsetOf(m_kNumbers[row]));
-    const Vec3 wanted = RestAim(row, aim);
-    return std::atan2(Vec3Length(Vec3Cross(reached, wanted)), Vec3Dot(reached, wanted)) / kDegreesToRadians64;
+    return AngleBetween(Turned(Axis(row), OffsetOf(m_kNumbers[row])), RestAim(row, aim));
 }
 
 // Whether a child's rotation against its parent's gets lost: a conversion cannot decompose it before the

@@ -3,6 +3,7 @@
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
 #include "CNode.h"
+#include "JointSteps.h"
 
 #include <algorithm>
 #include <cmath>
@@ -23,13 +24,20 @@ Mat3 SnappedToAxes(const Mat3& axes)
     return isWhole ? snapped : axes;
 }
 
+// Legs that are spread roll the feet, whose soles are taken to lie flat.
+bool HasLegsTogether(const BodyStance& stance)
+{
+    constexpr double kMostApart = 37.0; // degrees
+    return stance.Stands() && *stance.apart < kMostApart;
+}
+
 } // namespace
 
 size_t CSourcePoses::Reference() const
 {
     for (size_t stance = 0; stance < Count(); ++stance)
     {
-        if (IsStance(m_kTree, stance, m_kLegs))
+        if (HasLegsTogether(StanceIn(m_kTree, stance, m_kBody)))
             return stance;
     }
     return std::min<size_t>(1, Count() - 1);
@@ -37,7 +45,7 @@ size_t CSourcePoses::Reference() const
 
 Mat3 CSourcePoses::Facing(size_t stance) const
 {
-    const BodyAxes axes = AxesOf(m_kTree, stance, m_kLegs);
+    const BodyStance axes = StanceIn(m_kTree, stance, m_kBody);
     Mat3 facing;
     facing.SetRow(0, axes.left);
     facing.SetRow(1, axes.up);
@@ -58,31 +66,20 @@ Vec3 CSourcePoses::Direction(size_t stance, int from, int to) const
     return Vec3Normalized(stances.Place(stance, to) - stances.Place(stance, from));
 }
 
-bool CSourcePoses::AreApart(int a, int b) const
-{
-    constexpr double kSamePlace = 1e-6; // as bones are compared
-    const CStances& stances = m_kTree.Stances();
-    const double size = 1.0 + Vec3Length(stances.Place(0, a));
-    return Vec3Length(stances.Place(0, b) - stances.Place(0, a)) > kSamePlace * size;
-}
-
 int CSourcePoses::JointBelow(int joint, int goal) const
 {
-    const std::vector<int> way = goal < 0 ? std::vector<int>() : m_kTree.WayDown(joint, goal);
+    const CStances& stances = m_kTree.Stances();
+    const std::vector<int> way = m_kTree.WayDown(joint, goal);
     int at = joint;
-    for (const int next : way)
+    for (size_t step = 0;; ++step)
     {
-        at = next;
-        if (AreApart(joint, at))
+        const std::vector<int>& children = m_kTree.Children(at);
+        if (step >= way.size() && children.empty())
+            return CJointTree::kNone;
+        at = step < way.size() ? way[step] : children.front();
+        if (ArePlacedApart(stances.Place(0, joint), stances.Place(0, at)))
             return at;
     }
-    while (!m_kTree.Children(at).empty())
-    {
-        at = m_kTree.Children(at).front();
-        if (AreApart(joint, at))
-            return at;
-    }
-    return CJointTree::kNone;
 }
 
 } // namespace gw

@@ -1,5 +1,6 @@
 #include "CTargetBones.h"
 
+#include "BodyTree.h"
 #include "CNode.h"
 #include "CPoseSampler.h"
 
@@ -14,12 +15,8 @@ Mat3 CTargetBones::RestTurn(std::string_view bone) const
 Vec3 CTargetBones::ChildAxis(std::string_view bone) const
 {
     const CNode* node = m_kNames.Find(bone);
-    for (size_t i = 0; node && i < node->GetChildCount(); ++i)
-    {
-        if (const CNode* child = RecordCast<CNode>(node->ChildAt(i)))
-            return Vec3Normalized(RestLocal(*child).Translation());
-    }
-    return kVec3UnitY;
+    const CNode* const child = node ? FirstChild(*node) : nullptr;
+    return child ? Vec3Normalized(RestLocal(*child).Translation()) : kVec3UnitY;
 }
 
 } // namespace gw

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "BodyJoints.h"
+#include "HostBones.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -30,27 +31,27 @@ struct HostRow
 
 /// The host skeleton's bones, in the order of its profiles.
 inline constexpr HostRow kHostRows[] = {
-    {"LowerTorso", EBodyJoint::Hip,      EBodySide::Left,  EHostAim::Next,  2, 0},
-    {"Waist",      EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  1, 1},
-    {"UpperTorso", EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  2, 1},
-    {"Neck",       EBodyJoint::Neck,     EBodySide::Left,  EHostAim::Next,  1, 1},
-    {"Head",       EBodyJoint::Head,     EBodySide::Left,  EHostAim::Head,  0, 1},
-    {"LCollar",    EBodyJoint::Clavicle, EBodySide::Left,  EHostAim::Next,  1, 3},
-    {"LUpperArm",  EBodyJoint::UpperArm, EBodySide::Left,  EHostAim::Next,  1, 1},
-    {"LForearm",   EBodyJoint::Forearm,  EBodySide::Left,  EHostAim::Next,  1, 1},
-    {"LHand",      EBodyJoint::Hand,     EBodySide::Left,  EHostAim::Hand,  0, 1},
-    {"RCollar",    EBodyJoint::Clavicle, EBodySide::Right, EHostAim::Next,  1, 7},
-    {"RUpperArm",  EBodyJoint::UpperArm, EBodySide::Right, EHostAim::Next,  1, 1},
-    {"RForearm",   EBodyJoint::Forearm,  EBodySide::Right, EHostAim::Next,  1, 1},
-    {"RHand",      EBodyJoint::Hand,     EBodySide::Right, EHostAim::Hand,  0, 1},
-    {"LPelvis",    EBodyJoint::Hip,      EBodySide::Left,  EHostAim::None,  0, 0},
-    {"LThigh",     EBodyJoint::Thigh,    EBodySide::Left,  EHostAim::None,  0, 0},
-    {"LCalf",      EBodyJoint::Shin,     EBodySide::Left,  EHostAim::None,  0, 1},
-    {"LFoot",      EBodyJoint::Foot,     EBodySide::Left,  EHostAim::Child, 0, 1},
-    {"RPelvis",    EBodyJoint::Hip,      EBodySide::Right, EHostAim::None,  0, 0},
-    {"RThigh",     EBodyJoint::Thigh,    EBodySide::Right, EHostAim::None,  0, 0},
-    {"RCalf",      EBodyJoint::Shin,     EBodySide::Right, EHostAim::None,  0, 1},
-    {"RFoot",      EBodyJoint::Foot,     EBodySide::Right, EHostAim::Child, 0, 1},
+    {kRootBone,            EBodyJoint::Hip,      EBodySide::Left,  EHostAim::Next,  2, 0},
+    {kWaistBone,           EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  1, 1},
+    {kTorsoBone,           EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  2, 1},
+    {kNeckBone,            EBodyJoint::Neck,     EBodySide::Left,  EHostAim::Next,  1, 1},
+    {kHeadBone,            EBodyJoint::Head,     EBodySide::Left,  EHostAim::Head,  0, 1},
+    {kLeftBones.collar,    EBodyJoint::Clavicle, EBodySide::Left,  EHostAim::Next,  1, 3},
+    {kLeftBones.upperArm,  EBodyJoint::UpperArm, EBodySide::Left,  EHostAim::Next,  1, 1},
+    {kLeftBones.forearm,   EBodyJoint::Forearm,  EBodySide::Left,  EHostAim::Next,  1, 1},
+    {kLeftBones.hand,      EBodyJoint::Hand,     EBodySide::Left,  EHostAim::Hand,  0, 1},
+    {kRightBones.collar,   EBodyJoint::Clavicle, EBodySide::Right, EHostAim::Next,  1, 7},
+    {kRightBones.upperArm, EBodyJoint::UpperArm, EBodySide::Right, EHostAim::Next,  1, 1},
+    {kRightBones.forearm,  EBodyJoint::Forearm,  EBodySide::Right, EHostAim::Next,  1, 1},
+    {kRightBones.hand,     EBodyJoint::Hand,     EBodySide::Right, EHostAim::Hand,  0, 1},
+    {kLeftBones.pelvis,    EBodyJoint::Hip,      EBodySide::Left,  EHostAim::None,  0, 0},
+    {kLeftBones.thigh,     EBodyJoint::Thigh,    EBodySide::Left,  EHostAim::None,  0, 0},
+    {kLeftBones.calf,      EBodyJoint::Shin,     EBodySide::Left,  EHostAim::None,  0, 1},
+    {kLeftBones.foot,      EBodyJoint::Foot,     EBodySide::Left,  EHostAim::Child, 0, 1},
+    {kRightBones.pelvis,   EBodyJoint::Hip,      EBodySide::Right, EHostAim::None,  0, 0},
+    {kRightBones.thigh,    EBodyJoint::Thigh,    EBodySide::Right, EHostAim::None,  0, 0},
+    {kRightBones.calf,     EBodyJoint::Shin,     EBodySide::Right, EHostAim::None,  0, 1},
+    {kRightBones.foot,     EBodyJoint::Foot,     EBodySide::Right, EHostAim::Child, 0, 1},
 };
 inline constexpr size_t kWaistRow = 1;
 

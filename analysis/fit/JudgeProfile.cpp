@@ -1,9 +1,12 @@
 #include "JudgeProfile.h"
 
 #include "BodyJoints.h"
+#include "BodyOfTable.h"
+#include "BodySides.h"
 #include "BodyTree.h"
 #include "CRetargeter.h"
 #include "FindBodyByNames.h"
+#include "HostBones.h"
 #include "RowTurns.h"
 #include "Skeleton.h"
 
@@ -77,9 +80,9 @@ void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdic
 }
 
 void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
-                ProfileVerdict& verdict)
+                const BodyStance& rest, ProfileVerdict& verdict)
 {
-    const std::vector<RowTurn> turns = MeasureTurns(table, targets, body);
+    const std::vector<RowTurn> turns = MeasureTurns(table, targets, body, rest);
     for (const RowTurn& turn : turns)
     {
         verdict.turn += turn.degrees / static_cast<double>(turns.size());
@@ -111,8 +114,8 @@ ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets,
     for (const BodyDoubt& doubt : CheckBody(body, source.tree))
         verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
-    CheckSpine(body, table.SourceOf(targets.Find("UpperTorso")), verdict);
-    CheckTurns(table, targets, body, verdict);
+    CheckSpine(body, table.SourceOf(targets.Find(kTorsoBone)), verdict);
+    CheckTurns(table, targets, body, StanceIn(source.tree, 0, body), verdict);
     verdict.sureness = SurenessOf(verdict.doubts);
     return verdict;
 }

@@ -1,10 +1,11 @@
 #include "RowTurns.h"
 
-#include "Angles.h"
 #include "BodyTree.h"
 #include "CBodyPoses.h"
 #include "CPoseMatcher.h"
 #include "CRetargeter.h"
+#include "Directions.h"
+#include "HostBones.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -25,21 +26,21 @@ struct LeadRow
 };
 
 constexpr LeadRow kLeads[] = {
-    {"LowerTorso", nullptr,      false},
-    {"Waist",      "UpperTorso", false},
-    {"UpperTorso", nullptr,      false},
-    {"Neck",       "Head",       false},
-    {"Head",       nullptr,      false},
-    {"LCollar",    "LUpperArm",  false},
-    {"LUpperArm",  "LForearm",   false},
-    {"LForearm",   "LHand",      false},
-    {"LHand",      nullptr,      true },
-    {"LFoot",      nullptr,      false},
-    {"RCollar",    "RUpperArm",  false},
-    {"RUpperArm",  "RForearm",   false},
-    {"RForearm",   "RHand",      false},
-    {"RHand",      nullptr,      true },
-    {"RFoot",      nullptr,      false},
+    {kRootBone,            nullptr,              false},
+    {kWaistBone,           kTorsoBone,           false},
+    {kTorsoBone,           nullptr,              false},
+    {kNeckBone,            kHeadBone,            false},
+    {kHeadBone,            nullptr,              false},
+    {kLeftBones.collar,    kLeftBones.upperArm,  false},
+    {kLeftBones.upperArm,  kLeftBones.forearm,   false},
+    {kLeftBones.forearm,   kLeftBones.hand,      false},
+    {kLeftBones.hand,      nullptr,              true },
+    {kLeftBones.foot,      nullptr,              false},
+    {kRightBones.collar,   kRightBones.upperArm, false},
+    {kRightBones.upperArm, kRightBones.forearm,  false},
+    {kRightBones.forearm,  kRightBones.hand,     false},
+    {kRightBones.hand,     nullptr,              true },
+    {kRightBones.foot,     nullptr,              false},
 };
 
 // A row of the table, with what its direction needs.
@@ -80,22 +81,11 @@ std::vector<Lead> FindLeads(const CRetargeter& table, const CNodeNames& targets)
     return leads;
 }
 
-// The shortest turn from one direction to another, as a matrix that multiplies rows from the right.
-Mat3 ShortestTurn(const Vec3& from, const Vec3& to)
+// Places near the end of 32 bits give no number; such a bone stands as wrong as can be.
+double AngleBetweenRotations(const Mat3& a, const Mat3& b)
 {
-    const Vec3 axis = Vec3Cross(from, to);
-    if (Vec3Length(axis) < 1e-6)
-        return Vec3Dot(from, to) > 0.0 ? kMat3Identity : Mat3FromAxisAngle(kVec3UnitZ, kPi);
-    return Mat3FromAxisAngle(Vec3Normalized(axis),
-                             static_cast<float>(SafeAcos(static_cast<float>(Vec3Dot(from, to)))));
-}
-
-double DegreesBetweenRotations(const Mat3& a, const Mat3& b)
-{
-    const Mat3 difference = a * Mat3Transpose(b);
-    const float trace = difference.m[0] + difference.m[4] + difference.m[8];
-    // Places near the end of 32 bits give no number; such a bone stands as wrong as can be.
-    return std::isfinite(trace) ? SafeAcos((trace - 1.0f) / 2.0f) * kRadiansToDegrees64 : 180.0;
+    const double angle = AngleOf(a * Mat3Transpose(b));
+    return std::isfinite(angle) ? angle : 180.0;
 }
 
 // Where the source's bone leads to in the body's own axes; nothing where joints coincide.
@@ -118,8 +108,8 @@ double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses)
     // The target stands along the axes at rest: left is x, up is y.
     Mat3 wanted = NormalizedRows(RestWorld(*lead.target));
     if (const std::optional<Vec3> direction = Direction(lead, poses, toBody))
-        wanted = wanted * ShortestTurn(wanted.Row(1), *direction);
-    return DegreesBetweenRotations(turned, wanted);
+        wanted = wanted * LeastSwing(wanted.Row(1), *direction);
+    return AngleBetweenRotations(turned, wanted);
 }
 
 bool HasLimbs(const CBodyMap& body)
@@ -130,11 +120,12 @@ bool HasLimbs(const CBodyMap& body)
 
 } // namespace
 
-std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body)
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
+                                  const BodyStance& rest)
 {
     if (!HasLimbs(body))
         return {};
-    CBodyPoses poses(body);
+    CBodyPoses poses(body, rest);
     const std::vector<Lead> leads = FindLeads(table, targets);
     std::vector<RowTurn> turns;
     for (const Lead& lead : leads)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CBodyMap.h"
+#include "BodyStance.h"
 
 #include <vector>
 
@@ -21,6 +21,7 @@ struct RowTurn
 /// stands across. Looked at is the source's rest pose where a body stands in it, else some frames of its
 /// motion. Thighs and calves are not told, since planting turns them anyway; nothing is, where the body has
 /// not both arms and legs. The source's nodes are as they were when this returns.
-std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body);
+std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
+                                  const BodyStance& rest);
 
 } // namespace gw

@@ -46,6 +46,7 @@ SuggestedProfile CSuggester::Suggest() const
     SuggestedProfile profile;
     profile.sidesAreSure = m_kFound.sidesAreSure;
     profile.restIsStance = m_kPoses.StandsAtRest();
+    profile.turnsFromRest = m_kPoses.Reference() == 0;
     for (const BodyPlace& place : BodyPlaces())
     {
         if (IsNeeded(place.joint) && !CanName(JointAt(m_kFound.body, place)))

@@ -55,7 +55,8 @@ struct SuggestedProfile
     std::vector<SuggestedRow> rows; ///< in the order of the target's bones, with those that came to nothing
     std::vector<BodyPlace> missing; ///< of the thirteen joints: none in a profile that drives the whole body
     bool sidesAreSure = true;       ///< names or poses show which side is the left one
-    bool restIsStance = true;       ///< else the turns about the bones come from a frame of the motion
+    bool restIsStance = true;       ///< a body could stand as it does at rest
+    bool turnsFromRest = true;      ///< else the turns about the bones come from a frame of the motion
 
     /// The rows that stand in the profile.
     CMapRowTable Table() const;

@@ -1,18 +1,20 @@
 #include "BodyParts.h"
 
+#include "HostBones.h"
+
 #include <algorithm>
 
 namespace gw {
 
 namespace {
 
-constexpr std::string_view kUpperArms[] = {"LUpperArm", "RUpperArm"};
-constexpr std::string_view kForearms[] = {"LForearm", "RForearm"};
-constexpr std::string_view kThighs[] = {"LThigh", "RThigh"};
-constexpr std::string_view kCalves[] = {"LCalf", "RCalf"};
-constexpr std::string_view kSpine[] = {"LowerTorso", "Waist", "UpperTorso"};
-constexpr std::string_view kNeck[] = {"Neck"};
-constexpr std::string_view kHead[] = {"Head"};
+constexpr std::string_view kUpperArms[] = {kLeftBones.upperArm, kRightBones.upperArm};
+constexpr std::string_view kForearms[] = {kLeftBones.forearm, kRightBones.forearm};
+constexpr std::string_view kThighs[] = {kLeftBones.thigh, kRightBones.thigh};
+constexpr std::string_view kCalves[] = {kLeftBones.calf, kRightBones.calf};
+constexpr std::string_view kSpine[] = {kRootBone, kWaistBone, kTorsoBone};
+constexpr std::string_view kNeck[] = {kNeckBone};
+constexpr std::string_view kHead[] = {kHeadBone};
 
 constexpr BodyPart kParts[] = {
     {"upper arm", kUpperArms},

@@ -1,5 +1,6 @@
 #include "BoneEnds.h"
 
+#include "BodyTree.h"
 #include "BonePairs.h"
 #include "CPoseSampler.h"
 #include "JointSteps.h"
@@ -10,23 +11,14 @@ namespace gw {
 
 namespace {
 
-template <class Visit>
-void EachChild(const CNode& node, const Visit& visit)
-{
-    for (size_t i = 0; i < node.GetChildCount(); ++i)
-    {
-        if (CNode* child = RecordCast<CNode>(node.ChildAt(i)))
-            visit(*child);
-    }
-}
-
 // The first mapped bone at or below a node, depth first.
 CNode* FirstMapped(CNode& node, const CSourceTable& sources)
 {
     if (sources.SourceOf(&node))
         return &node;
     CNode* mapped = nullptr;
-    EachChild(node, [&](CNode& child) { mapped = mapped ? mapped : FirstMapped(child, sources); });
+    for (CNode* child : ChildNodes(node))
+        mapped = mapped ? mapped : FirstMapped(*child, sources);
     return mapped;
 }
 
@@ -44,22 +36,16 @@ CNode* NextMapped(const CNode& target, const CSourceTable& sources)
 {
     CNode* next = nullptr;
     double least = 0.0;
-    EachChild(target, [&](CNode& child) {
-        CNode* mapped = FirstMapped(child, sources);
+    for (CNode* child : ChildNodes(target))
+    {
+        CNode* mapped = FirstMapped(*child, sources);
         const double share = mapped ? SidewaysShare(target, *mapped) : 0.0;
         if (!mapped || (next && share >= least))
-            return;
+            continue;
         next = mapped;
         least = share;
-    });
+    }
     return next;
-}
-
-bool IsAbove(const CNode& node, const CNode* below)
-{
-    while (below && below != &node)
-        below = below->GetParentNode();
-    return below != nullptr;
 }
 
 // The nearest node at or above a source bone that has the next bone's source below it: the bone itself where
@@ -67,7 +53,7 @@ bool IsAbove(const CNode& node, const CNode* below)
 CNode* SourceStart(CNode& source, const CNode* next)
 {
     CNode* start = &source;
-    while (next && start && (start == next || !IsAbove(*start, next)))
+    while (next && start && (start == next || !IsAtOrBelow(next, start)))
         start = start->GetParentNode();
     return start ? start : &source;
 }

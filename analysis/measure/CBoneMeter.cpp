@@ -3,6 +3,7 @@
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
 #include "CNode.h"
+#include "Directions.h"
 
 namespace gw {
 
@@ -35,7 +36,7 @@ void CBoneMeter::Add()
 {
     m_kSource.Add();
     m_kTarget.Add();
-    m_fLastError = DegreesBetween(m_kSource.Direction(), m_kTarget.Direction());
+    m_fLastError = AngleBetween(m_kSource.Direction(), m_kTarget.Direction());
     if (m_fLastError > m_kErrors.Largest())
         m_iLargestFrame = m_iFrame;
     m_kErrors.Add(m_fLastError);

@@ -2,6 +2,7 @@
 
 #include "BodyParts.h"
 #include "CNode.h"
+#include "HostBones.h"
 
 #include <algorithm>
 #include <cmath>
@@ -62,7 +63,7 @@ void CDetailRecorder::AddMainBone(const BonePair& pair, const CSourceTable& sour
     BoneEnds ends = FindBoneEnds(pair, sources);
     if (!ends.target || !ends.source)
     {
-        if (pair.target->NameView() != "Head")
+        if (pair.target->NameView() != kHeadBone)
             return;
         ends = {nullptr, nullptr, pair.source};
     }

@@ -2,6 +2,7 @@
 
 #include "BoneEnds.h"
 #include "CNode.h"
+#include "HostBones.h"
 #include "JointSteps.h"
 
 namespace gw {
@@ -38,7 +39,7 @@ std::vector<LegPair> FindLegs(std::span<const BonePair> pairs, const CSourceTabl
     for (const BonePair& pair : pairs)
     {
         const std::string_view name = pair.target->NameView();
-        if (name != "LFoot" && name != "RFoot")
+        if (name != kLeftBones.foot && name != kRightBones.foot)
             continue;
         const BoneEnds toes = FindBoneEnds(pair, sources);
         const LegJoints result = ResultLeg(*pair.target, toes.target);

@@ -1,6 +1,7 @@
 #include "CConversionSection.h"
 
 #include "FigureDrawing.h"
+#include "HostBones.h"
 #include "PathDrawing.h"
 #include "Tables.h"
 
@@ -12,8 +13,6 @@ namespace gw {
 namespace {
 
 constexpr size_t kWorstFrames = 3;
-constexpr const char* kRightThigh = "RThigh";
-constexpr const char* kLeftThigh = "LThigh";
 
 std::vector<std::string> NamesOf(const std::vector<BoneMeasures>& bones, std::string BoneMeasures::*side)
 {
@@ -135,7 +134,7 @@ void CConversionSection::AppendWorstFrames(CMarkup& page) const
         const WorstFrame& worst = m_kWorst[i];
         FigurePair pair{source.Pose(worst.frame, worst.fault, worst.source),
                         result.Pose(worst.frame * sums.frameScale, worst.fault, worst.target),
-                        result.Across(kRightThigh, kLeftThigh)};
+                        result.Across(kRightBones.thigh, kLeftBones.thigh)};
         PlaceFigure(pair.source, m_kMotion.measured->detail.sourceFloor, SourceScale(sums));
         PlaceFigure(pair.result, 0.0, 1.0);
         page.Raw("<article><p><b class=\"number\">").Integer(static_cast<long long>(i + 1));

@@ -43,21 +43,11 @@ bool IsFinite(const Vec3& v)
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
 }
 
-bool HasChildNode(const CNode& node)
-{
-    for (size_t i = 0; i < node.GetChildCount(); ++i)
-    {
-        if (RecordCast<CNode>(node.ChildAt(i)))
-            return true;
-    }
-    return false;
-}
-
 // The end of a bone that has no joint there.
 std::optional<Vec3> FreeEnd(const CNode& node)
 {
     const CBoneMesh* mesh = FindBoneMesh(node);
-    if (!mesh || mesh->m_fLength <= 0.0f || HasChildNode(node))
+    if (!mesh || mesh->m_fLength <= 0.0f || !node.HasNoNodeChild())
         return std::nullopt;
     return TransformCoord(mesh->Axis() * mesh->m_fLength, mesh->m_kMatrix * node.m_kWorldMatrix);
 }

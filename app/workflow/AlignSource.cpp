@@ -2,6 +2,7 @@
 
 #include "AimBones.h"
 #include "AlignMotion.h"
+#include "BodyOfTable.h"
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
 #include "CKeyframeControl.h"

@@ -8,6 +8,7 @@
 #include "FailureWords.h"
 #include "FindBone.h"
 #include "FitWords.h"
+#include "HostBones.h"
 #include "Mat4.h"
 #include "ProfileFit.h"
 #include "SourceTiming.h"
@@ -18,8 +19,6 @@
 namespace gw {
 
 namespace {
-
-constexpr const char* kRootBone = "LowerTorso";
 
 // Rows divided by their lengths and multiplied by them again, as results have always been made; a row of
 // length 0 is left alone.

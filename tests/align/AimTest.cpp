@@ -8,11 +8,11 @@
 #include "CMadeBody.h"
 #include "CPoseSampler.h"
 #include "CRetargeter.h"
+#include "Directions.h"
 #include "MotionNode.h"
 #include "RestMisfits.h"
 #include "Rotations.h"
 #include "Skeleton.h"
-#include "Turns.h"
 
 #include <gtest/gtest.h>
 

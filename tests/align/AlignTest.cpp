@@ -5,9 +5,9 @@
 #include "CKeyframeControl.h"
 #include "CMadeBody.h"
 #include "CPoseSampler.h"
+#include "Directions.h"
 #include "Rotations.h"
 #include "Skeleton.h"
-#include "Turns.h"
 
 #include <algorithm>
 #include <cmath>

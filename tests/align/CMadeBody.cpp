@@ -4,10 +4,10 @@
 #include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "CPoseSampler.h"
+#include "Directions.h"
 #include "MotionNode.h"
 #include "Skeleton.h"
 #include "TKBVHStream.h"
-#include "Turns.h"
 
 #include <algorithm>
 #include <cmath>

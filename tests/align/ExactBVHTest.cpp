@@ -4,11 +4,11 @@
 #include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "CMadeBody.h"
+#include "Directions.h"
 #include "Rotations.h"
 #include "Skeleton.h"
 #include "TKBVHStream.h"
 #include "TempFolder.h"
-#include "Turns.h"
 
 #include <gtest/gtest.h>
 

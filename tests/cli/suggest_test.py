@@ -9,6 +9,12 @@ from pathlib import Path
 THIRTEEN = {"LowerTorso", "UpperTorso", "Head", *(side + bone for side in "LR" for bone in
             ("UpperArm", "Forearm", "Hand", "Thigh", "Calf"))}
 
+# What the rest poses of the real files are, if not T-poses.
+REST_POSES = {
+    "bandai_walk_normal_002": "none", "rokoko_jesse_dance": "none", "cmu1_jumping_jacks": "arms down",
+    "julia_example": "arms down", "mocapbank_lefthip": "arms down", "yxz_lefthip": "arms down",
+    "daz3d_genesis": "A-pose", "makehuman_tpose": "A-pose", "geno_stance": "other"}
+
 
 def scrambled():
     """The walk with names that say nothing, and what each was."""
@@ -91,9 +97,14 @@ class Suggest(CliTest):
                 if result.code == FAILED:  # two are no bodies, one has an empty line where none may stand
                     self.assertRegex(result.err, "missing|empty line")
                     continue
-                rows = {row["target"]: row for row in json.loads(result.out)["rows"]}
+                profile = json.loads(result.out)
+                rows = {row["target"]: row for row in profile["rows"]}
                 self.assertEqual({rows[bone]["sureness"] for bone in THIRTEEN}, {"sure"})
-                self.succeed("convert", path, "-o", "a.htr", "--profile", "a.prf", "--force")
+                told = self.succeed("convert", path, "-o", "a.htr", "--profile", "a.prf", "--force").err
+                facts = json.loads(self.run_program("doctor", path, "--json").out)["facts"]
+                pose = REST_POSES.get(path.stem, "T-pose")
+                self.assertEqual((facts["restPose"], profile["restIsStance"], "the rest pose is no T-pose" in told),
+                                 (pose, pose != "none", pose != "T-pose"))
 
 
 if __name__ == "__main__":

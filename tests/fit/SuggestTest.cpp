@@ -208,22 +208,6 @@ TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
     }
 }
 
-TEST(ShortestTurn, TakesOneDirectionToAnother)
-{
-    const Vec3 directions[] = {
-        kVec3UnitX, kVec3UnitY, kVec3UnitZ, -kVec3UnitX, -kVec3UnitY, {0.6f, 0.0f, -0.8f}
-    };
-    for (const Vec3& from : directions)
-    {
-        for (const Vec3& to : directions)
-        {
-            const Mat3 turn = ShortestTurn(from, to);
-            const Vec3 reached = turn.Row(0) * from.x + turn.Row(1) * from.y + turn.Row(2) * from.z;
-            EXPECT_GT(Vec3Dot(reached, to), 0.99999);
-        }
-    }
-}
-
 TEST(SuggestedName, IsReadable)
 {
     EXPECT_EQ(SuggestedName("walk_01"), "walk 01");

@@ -208,10 +208,11 @@ EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* s
     if (!WriteProfile(options.output, ProfileText(name, frameRate, kVec3Zero, profile.Table())))
         return EExit::Failed;
     WarnOfRate(options, SourceRateOf(sourceRoot), frameRate);
-    if (!profile.restIsStance)
+    if (!profile.turnsFromRest)
         SayWord(options,
-                "the rest pose is none that a body stands in; how bones are turned about themselves was "
-                "taken from a frame of the motion");
+                std::string("the rest pose ") +
+                    (profile.restIsStance ? "has its legs spread" : "is none that a body stands in") +
+                    "; how bones are turned about themselves was taken from a frame of the motion");
     if (options.json)
     {
         WriteJson(options, name, profile);

@@ -1,4 +1,5 @@
 #include "CRetargeter.h"
+#include "HostBones.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -26,7 +27,7 @@ int TargetLinks(const CNode* foot)
     int links = 0;
     for (const CNode* node = foot->GetParentNode(); node; node = node->GetParentNode())
     {
-        if (node->NameView() == "LPelvis" || node->NameView() == "LowerTorso")
+        if (node->NameView() == kLeftBones.pelvis || node->NameView() == kRootBone)
             break;
         ++links;
     }
@@ -67,10 +68,10 @@ struct LegWalk
 
 void CRetargeter::MeasureBody(float& scale, float& footRise, float weight) const
 {
-    const CNode* torso = FindNode(m_pkTargetRoot, "LowerTorso");
-    const CNode* leftFoot = FindNode(m_pkTargetRoot, "LFoot");
-    const CNode* rightFoot = FindNode(m_pkTargetRoot, "RFoot");
-    const CNode* leftThigh = FindNode(m_pkTargetRoot, "LThigh");
+    const CNode* torso = FindNode(m_pkTargetRoot, kRootBone);
+    const CNode* leftFoot = FindNode(m_pkTargetRoot, kLeftBones.foot);
+    const CNode* rightFoot = FindNode(m_pkTargetRoot, kRightBones.foot);
+    const CNode* leftThigh = FindNode(m_pkTargetRoot, kLeftBones.thigh);
     const CNode* sourceHip = SourceOf(m_pkTargetRoot);
     const CNode* sourceLFoot = SourceOf(leftFoot);
     const CNode* sourceRFoot = SourceOf(rightFoot);

@@ -112,7 +112,7 @@ double CFaithfulLeg::KneeAngle(size_t frame) const
 
 Vec3 CFaithfulLeg::Forward(const CPoseMatcher& matcher) const
 {
-    return ToWorld(m_kForward, NormalizedRows(matcher.Bones()[m_uiThigh].world));
+    return Turned(m_kForward, NormalizedRows(matcher.Bones()[m_uiThigh].world));
 }
 
 } // namespace gw

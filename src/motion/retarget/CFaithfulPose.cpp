@@ -2,6 +2,7 @@
 
 #include "CKeyframeControl.h"
 #include "Directions.h"
+#include "HostBones.h"
 #include "JointSteps.h"
 #include "Skeleton.h"
 
@@ -15,20 +16,15 @@ namespace {
 // farther off the line from hip to ankle.
 constexpr float kForwardHint = 10.0f;
 
-constexpr const char* kLegNames[][2] = {
-    {"LThigh", "LFoot"},
-    {"RThigh", "RFoot"},
-};
-
 std::vector<LegJoints> TargetLegs(CNode* root)
 {
     std::vector<LegJoints> legs;
-    for (const auto& [thigh, foot] : kLegNames)
+    for (const HostSide& side : kHostSides)
     {
-        CNode* const ankle = FindNode(root, foot);
+        CNode* const ankle = FindNode(root, side.foot);
         if (ankle && ankle->GetParentNode())
             legs.push_back(
-                {FindNode(root, thigh), ankle->GetParentNode(), ankle, JointBelow(*ankle, nullptr)});
+                {FindNode(root, side.thigh), ankle->GetParentNode(), ankle, JointBelow(*ankle, nullptr)});
     }
     return legs;
 }
@@ -59,10 +55,21 @@ bool IsFinite(const Vec3& v)
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
 }
 
+// LeastSwing of unit directions, with an axis that is rounded as results have always had it.
+Mat3 SwingBetween(const Vec3& from, const Vec3& to)
+{
+    const Vec3 across = Vec3Cross(from, to);
+    const double sine = Vec3Length(across);
+    if (sine == 0.0)
+        return LeastSwing(from, to);
+    return Mat3FromAxisAngle(across * static_cast<float>(1.0 / sine),
+                             static_cast<float>(std::atan2(sine, Vec3Dot(from, to))));
+}
+
 // A bone's world rotation, turned the least way so that its joint below lies in a direction.
 Mat3 PointedTo(const Vec3& direction, const Mat3& bone, const Vec3& jointBelow)
 {
-    return bone * SwingBetween(Vec3Normalized(ToWorld(jointBelow, bone)), Vec3Normalized(direction));
+    return bone * SwingBetween(Vec3Normalized(Turned(jointBelow, bone)), Vec3Normalized(direction));
 }
 
 } // namespace

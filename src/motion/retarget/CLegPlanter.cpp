@@ -2,6 +2,7 @@
 
 #include "CFaithfulLeg.h"
 #include "CKeyframeControl.h"
+#include "HostBones.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -29,22 +30,21 @@ size_t Index(int bone)
 } // namespace
 
 CLegPlanter::CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode& targetRoot)
-    : m_kMatcher(matcher), m_iTorso(matcher.IndexOf(FindNode(&targetRoot, "LowerTorso"))),
+    : m_kMatcher(matcher), m_iTorso(matcher.IndexOf(FindNode(&targetRoot, kRootBone))),
       m_pkSourcePelvis(m_iTorso < 0 ? nullptr : retargeter.SourceOf(matcher.Bones()[Index(m_iTorso)].node)),
       m_kSolver(2)
 {
     if (!m_pkSourcePelvis)
         return;
-    Plan(retargeter, targetRoot, "LThigh", "LFoot");
-    Plan(retargeter, targetRoot, "RThigh", "RFoot");
+    for (const HostSide& side : kHostSides)
+        Plan(retargeter, targetRoot, side);
 }
 
-bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const char* thighName,
-                       const char* footName)
+bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const HostSide& side)
 {
     const auto& bones = m_kMatcher.Bones();
-    const int thigh = m_kMatcher.IndexOf(FindNode(&targetRoot, thighName));
-    const int foot = m_kMatcher.IndexOf(FindNode(&targetRoot, footName));
+    const int thigh = m_kMatcher.IndexOf(FindNode(&targetRoot, side.thigh));
+    const int foot = m_kMatcher.IndexOf(FindNode(&targetRoot, side.foot));
     const int calf = foot < 0 ? -1 : bones[Index(foot)].parent;
     if (thigh < 0 || calf < 0 || bones[Index(calf)].parent < 0)
         return false;

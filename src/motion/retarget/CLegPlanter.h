@@ -9,6 +9,7 @@ namespace gw {
 
 class CFaithfulLeg;
 class CKeyframeControl;
+struct HostSide;
 
 /// Plants the feet: turns the thigh and calf of each leg so that the ankle stands where the source's does,
 /// scaled, as seen from the pelvis. Feet keep the rotation that they have.
@@ -39,7 +40,7 @@ private:
         std::vector<size_t> path; ///< from the root down to the calf
     };
 
-    bool Plan(const CRetargeter& retargeter, CNode& targetRoot, const char* thigh, const char* foot);
+    bool Plan(const CRetargeter& retargeter, CNode& targetRoot, const HostSide& side);
     void UpdatePath(const LegRecord& leg);
     Vec3 HintPoint(const LegRecord& leg) const;
     void LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const;

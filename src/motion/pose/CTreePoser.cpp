@@ -1,10 +1,9 @@
 #include "CTreePoser.h"
 
-#include "Skeleton.h"
-
 namespace gw {
 
-CTreePoser::CTreePoser(CNode& root, float frequency) : m_kJoints(NodesOf(root)), m_kSampler(frequency)
+CTreePoser::CTreePoser(std::vector<CNode*> joints, float frequency)
+    : m_kJoints(std::move(joints)), m_kSampler(frequency)
 {
     for (CNode* joint : m_kJoints)
     {

@@ -1,4 +1,4 @@
-#include "Turns.h"
+#include "Directions.h"
 
 #include "Angles.h"
 
@@ -24,6 +24,13 @@ Vec3 AnyAcross(const Vec3& direction)
 Vec3 Turned(const Vec3& direction, const Mat3& turn)
 {
     return turn.Row(0) * direction.x + turn.Row(1) * direction.y + turn.Row(2) * direction.z;
+}
+
+Vec3 ToLocal(const Vec3& direction, const Mat3& axes)
+{
+    return {static_cast<float>(Vec3Dot(direction, axes.Row(0))),
+            static_cast<float>(Vec3Dot(direction, axes.Row(1))),
+            static_cast<float>(Vec3Dot(direction, axes.Row(2)))};
 }
 
 Mat3 TurnAbout(const Vec3& axis, double degrees)
@@ -65,6 +72,7 @@ double TwistBetween(const Vec3& from, const Vec3& to, const Vec3& axis)
     return std::atan2(Vec3Dot(Vec3Cross(a, b), axis), Vec3Dot(a, b)) * kRadiansToDegrees64;
 }
 
+// By sine and cosine together: an arc cosine of floats knows no angle below a fiftieth of a degree.
 double AngleBetween(const Vec3& a, const Vec3& b)
 {
     return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;
@@ -80,6 +88,24 @@ double AngleOf(const Mat3& turn)
 Vec3 Across(const Vec3& direction, const Vec3& axis)
 {
     return direction - axis * static_cast<float>(Vec3Dot(direction, axis));
+}
+
+std::string_view AxisName(const Vec3& axis)
+{
+    const bool minus = axis.x + axis.y + axis.z < 0.0f;
+    const std::string_view name = axis.x != 0.0f ? "-X" : axis.y != 0.0f ? "-Y" : "-Z";
+    return name.substr(minus ? 0 : 1);
+}
+
+Vec3 NearestAxis(const Vec3& direction)
+{
+    Vec3 nearest = kVec3UnitY;
+    for (const Vec3& axis : {kVec3UnitX, kVec3UnitY, kVec3UnitZ, -kVec3UnitX, -kVec3UnitY, -kVec3UnitZ})
+    {
+        if (Vec3Dot(axis, direction) > Vec3Dot(nearest, direction))
+            nearest = axis;
+    }
+    return nearest;
 }
 
 } // namespace gw

@@ -12,7 +12,8 @@ namespace gw {
 class CTreePoser
 {
 public:
-    CTreePoser(CNode& root, float frequency);
+    /// The joints of the tree are NodesOf its root.
+    CTreePoser(std::vector<CNode*> joints, float frequency);
 
     const std::vector<CNode*>& Joints() const { return m_kJoints; }
     /// The place of a joint in that list, or -1.

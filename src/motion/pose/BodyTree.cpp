@@ -58,4 +58,10 @@ std::vector<CNode*> ChildNodes(const CNode& node)
     return children;
 }
 
+CNode* FirstChild(const CNode& node)
+{
+    const std::vector<CNode*> children = ChildNodes(node);
+    return children.empty() ? nullptr : children.front();
+}
+
 } // namespace gw

@@ -6,6 +6,16 @@
 
 namespace gw {
 
+const CKeyframeControl* TrackOf(const CNode& node)
+{
+    for (CControl* control = node.GetControl(); control; control = control->GetNext())
+    {
+        if (const CKeyframeControl* track = RecordCast<CKeyframeControl>(control))
+            return track;
+    }
+    return nullptr;
+}
+
 const Mat4& RestLocal(const CNode& node)
 {
     for (CControl* control = node.GetControl(); control; control = control->GetNext())

@@ -1,19 +1,10 @@
 #include "CLegTrack.h"
 
+#include "BodyPose.h"
 #include "CPoseSampler.h"
 #include "Directions.h"
-#include "Figures.h"
 
 namespace gw {
-
-namespace {
-
-Vec3 PlaceOf(const CNode& node)
-{
-    return node.m_kWorldMatrix.Translation();
-}
-
-} // namespace
 
 CLegTrack::CLegTrack(const LegJoints& joints, double restFloor)
     : m_kJoints(joints), m_kHeelSole(SoleUnder(*joints.ankle, restFloor)),
@@ -44,7 +35,7 @@ Vec3 CLegTrack::Heading() const
 {
     if (HasToe())
         return Vec3Normalized(PlaceOf(*m_kJoints.toe) - PlaceOf(*m_kJoints.ankle));
-    return ToWorld(m_kHeading, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
+    return Turned(m_kHeading, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
 }
 
 void CLegTrack::SetHeading(const Vec3& direction)
@@ -62,13 +53,12 @@ void CLegTrack::Append()
 {
     const Vec3 knee = PlaceOf(*m_kJoints.knee);
     const Vec3 ankle = PlaceOf(*m_kJoints.ankle);
-    const Vec3 normal = ToWorld(m_kSoleNormal, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
+    const Vec3 normal = Turned(m_kSoleNormal, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
     m_kAnkles.push_back(ankle);
     if (HasToe())
         m_kToes.push_back(PlaceOf(*m_kJoints.toe));
-    m_kPostures.push_back(
-        {Heading(), static_cast<float>(DegreesBetween(normal, kVec3UnitY)), SoleHeight(),
-         static_cast<float>(DegreesBetween(knee - PlaceOf(*m_kJoints.thigh), ankle - knee))});
+    m_kPostures.push_back({Heading(), static_cast<float>(AngleBetween(normal, kVec3UnitY)), SoleHeight(),
+                           static_cast<float>(AngleBetween(knee - PlaceOf(*m_kJoints.thigh), ankle - knee))});
 }
 
 Vec3 SoleUnder(const CNode& joint, double restFloor)

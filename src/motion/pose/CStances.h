@@ -1,11 +1,11 @@
 #pragma once
 
+#include "CTreePoser.h"
 #include "Mat3.h"
-#include "Mat4.h"
 #include "Vec3.h"
 
 #include <cstddef>
-#include <unordered_map>
+#include <optional>
 #include <vector>
 
 namespace gw {
@@ -21,9 +21,9 @@ public:
     explicit CStances(CNode& root);
 
     /// The joints, depth first.
-    const std::vector<CNode*>& Joints() const { return m_kJoints; }
+    const std::vector<CNode*>& Joints() const { return m_kTree->Joints(); }
     /// The index of a joint; -1 for null and for one of another tree.
-    int IndexOf(const CNode* joint) const;
+    int IndexOf(const CNode* joint) const { return m_kTree->IndexOf(joint); }
 
     /// The number of poses. The first one is the rest pose.
     size_t Count() const { return m_kPlaces.size(); }
@@ -41,21 +41,13 @@ public:
 private:
     using Places = std::vector<Vec3>;
 
-    void BeginPose();
-    void AddJoint(size_t joint, const Mat4& world);
-    void AddRestPose();
-    void AddFrames();
+    void AddPose();
 
-    std::vector<CNode*> m_kJoints;
-    std::unordered_map<const CNode*, int> m_kIndex;
+    std::optional<CTreePoser> m_kTree;
     Places m_kLocalTips; // in the joint's space
     std::vector<Places> m_kPlaces;
     std::vector<Places> m_kTips;
     std::vector<std::vector<Mat3>> m_kTurns;
 };
-
-/// Where the bone of a node without node children ends, in the node's space; the origin where that is not
-/// known. A direction that has no sideways part is known in its signs only and lies at 45 degrees then.
-Vec3 BoneTip(const CNode& node);
 
 } // namespace gw

@@ -1,9 +1,9 @@
 #include "JointSteps.h"
 
+#include "BodyTree.h"
 #include "CNode.h"
 
 #include <algorithm>
-#include <vector>
 
 namespace gw {
 
@@ -17,20 +17,7 @@ constexpr double kAnkleShare = 0.05;
 
 bool ArePlacedApart(const CNode& a, const CNode& b)
 {
-    const Vec3 place = a.m_kWorldMatrix.Translation();
-    const Vec3 offset = b.m_kWorldMatrix.Translation() - place;
-    return Vec3Length(offset) > kSamePlace * (1.0 + Vec3Length(place));
-}
-
-std::vector<CNode*> ChildrenOf(const CNode& node)
-{
-    std::vector<CNode*> children;
-    for (size_t i = 0; i < node.GetChildCount(); ++i)
-    {
-        if (CNode* const child = RecordCast<CNode>(node.ChildAt(i)))
-            children.push_back(child);
-    }
-    return children;
+    return ArePlacedApart(a.m_kWorldMatrix.Translation(), b.m_kWorldMatrix.Translation());
 }
 
 // How many joints go on below one another; more than a finger has are as many as a finger has.
@@ -44,7 +31,7 @@ size_t BranchLength(CNode& top)
         std::vector<CNode*> below;
         for (const CNode* node : level)
         {
-            const std::vector<CNode*> children = ChildrenOf(*node);
+            const std::vector<CNode*> children = ChildNodes(*node);
             below.insert(below.end(), children.begin(), children.end());
         }
         level = std::move(below);
@@ -55,7 +42,7 @@ size_t BranchLength(CNode& top)
 // The first of the longest: a heel that ends at once does not stand for the toes.
 CNode* LongestBranch(const CNode& node)
 {
-    const std::vector<CNode*> children = ChildrenOf(node);
+    const std::vector<CNode*> children = ChildNodes(node);
     if (children.size() < 2)
         return children.empty() ? nullptr : children.front();
     return *std::ranges::max_element(children, {}, [](CNode* child) { return BranchLength(*child); });
@@ -89,16 +76,23 @@ CNode* JointAbove(const CNode& node)
     return parent;
 }
 
+CNode* NextBelow(const CNode& node, CNode* goal)
+{
+    CNode* const child = ChildTowards(node, goal);
+    return child ? child : LongestBranch(node);
+}
+
 CNode* JointBelow(const CNode& node, CNode* goal)
 {
-    for (const CNode* at = &node;;)
-    {
-        CNode* child = ChildTowards(*at, goal);
-        child = child ? child : LongestBranch(*at);
-        if (!child || ArePlacedApart(node, *child))
-            return child;
-        at = child;
-    }
+    CNode* below = NextBelow(node, goal);
+    while (below && !ArePlacedApart(node, *below))
+        below = NextBelow(*below, goal);
+    return below;
+}
+
+bool ArePlacedApart(const Vec3& a, const Vec3& b)
+{
+    return Vec3Length(b - a) > kSamePlace * (1.0 + Vec3Length(a));
 }
 
 } // namespace gw

@@ -45,9 +45,6 @@ inline std::optional<double> RatioOf(double result, double source, double least 
 /// that are not finite do not count.
 float Percentile(std::vector<float> values, double share);
 
-/// The angle between two directions in degrees, exact for small angles too; 0 where one has no length.
-double DegreesBetween(const Vec3& a, const Vec3& b);
-
 /// The distance of two points over the ground: in x and z alone.
 double GroundDistance(const Vec3& a, const Vec3& b);
 

@@ -8,8 +8,6 @@
 namespace gw {
 
 class CNode;
-class CNodeNames;
-class CRetargeter;
 
 /// The side of the body, by its own right and left.
 enum class EBodySide : uint8_t
@@ -58,11 +56,5 @@ struct CBodyMap
     /// And the two feet besides, without which none can be planted.
     bool HasFeet() const;
 };
-
-/// The body that the rows of a retargeter's table tell of a source skeleton: what drives the target's bones,
-/// with the joints between hip, neck and head as the source's tree has them. A toe is the only child joint of
-/// a foot where no row names it. A torso bone that is driven from outside the spine (a collar) names no
-/// joint.
-CBodyMap BodyOfTable(const CRetargeter& table, const CNodeNames& targets);
 
 } // namespace gw

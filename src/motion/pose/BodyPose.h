@@ -25,13 +25,4 @@ CNode* TrunkTop(const CBodyMap& body);
 /// Thigh to knee to ankle of the longer leg.
 double LegLength(const CBodyMap& body);
 
-/// Degrees by which a body strays from standing upright and straight, its limbs weighed by what they tell
-/// about a reference pose: legs down, shoulders over the hips, arms straight and down or sideways.
-double StanceError(const CBodyMap& body, const Vec3& up);
-/// Whether the body stands at all, whichever way is up: legs along the trunk, shoulders and feet facing as
-/// the hips do. `up` is the world axis, plus or minus, that the trunk lies along.
-bool FindStance(const CBodyMap& body, Vec3& up);
-/// The world axis, plus or minus, that is nearest to a direction.
-Vec3 NearestAxis(const Vec3& direction);
-
 } // namespace gw

@@ -7,6 +7,8 @@
 
 namespace gw {
 
+class CKeyframeControl;
+
 /// Whether a track's frequency is seconds from frame to frame: odd files give infinities and 0.
 bool IsFrameTime(float frequency);
 
@@ -28,6 +30,8 @@ private:
     std::unordered_set<const CNode*> m_kWatched;
 };
 
+/// The first track of a node, or null.
+const CKeyframeControl* TrackOf(const CNode& node);
 /// The matrix that a node has in the rest pose, relative to its parent.
 const Mat4& RestLocal(const CNode& node);
 /// The world matrix of a node in the rest pose of its tree, which need not be posed so.

@@ -1,7 +1,5 @@
 #include "Figures.h"
 
-#include "Angles.h"
-
 #include <cmath>
 
 namespace gw {
@@ -15,12 +13,6 @@ float Percentile(std::vector<float> values, double share)
     const auto rank = values.begin() + std::lround(std::clamp(share, 0.0, 1.0) * last);
     std::nth_element(values.begin(), rank, values.end());
     return *rank;
-}
-
-// By sine and cosine together: an arc cosine of floats knows no angle below a fiftieth of a degree.
-double DegreesBetween(const Vec3& a, const Vec3& b)
-{
-    return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;
 }
 
 double GroundDistance(const Vec3& a, const Vec3& b)

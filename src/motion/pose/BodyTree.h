@@ -17,5 +17,7 @@ CNode* CommonAncestor(CNode* a, CNode* b);
 std::vector<CNode*> NodesBetween(const CNode* top, const CNode* bottom);
 /// The child nodes of a node, in order.
 std::vector<CNode*> ChildNodes(const CNode& node);
+/// The first of them, or null.
+CNode* FirstChild(const CNode& node);
 
 } // namespace gw

@@ -1,0 +1,119 @@
+// A body is judged by its own axes and by directions between joints alone: which way is up in the world, how
+// a file turns its bones and how long they are says nothing about how somebody stands.
+
+#include "BodyStance.h"
+
+#include "CPoseSampler.h"
+#include "Directions.h"
+
+#include <algorithm>
+#include <array>
+
+namespace gw {
+
+namespace {
+
+// Degrees. In T-poses of real files an arm is 6 off the line through both shoulders at most, in all other
+// rest poses 43 or more.
+constexpr double kMostOfTPose = 32.0;
+constexpr double kMostOfAPose = 65.0;
+constexpr double kMostOfArmsDown = 30.0;
+// Legs that are spread are 20 off; in rest poses that nobody stands in they lie along the trunk.
+constexpr double kMostOfStance = 45.0;
+
+// A point is sooner taken up the tree than a matrix.
+Vec3 RestPlace(const CNode& joint)
+{
+    Vec3 place = RestLocal(joint).Translation();
+    for (const CNode* parent = joint.GetParentNode(); parent; parent = parent->GetParentNode())
+        place = TransformCoord(place, RestLocal(*parent));
+    return place;
+}
+
+constexpr std::string_view kRestPoseNames[] = {"unknown", "none", "T-pose", "A-pose", "arms down", "other"};
+
+using Angle = std::optional<double>;
+using Ways = std::array<Vec3, 2>; // by EBodySide; zero if a joint is missing
+
+Angle Between(const Vec3& a, const Vec3& b)
+{
+    return a == kVec3Zero || b == kVec3Zero ? std::nullopt : Angle(AngleBetween(a, b));
+}
+
+Angle Larger(const Ways& ways, const Vec3& left, const Vec3& right)
+{
+    const Angle a = Between(ways[0], left);
+    const Angle b = Between(ways[1], right);
+    return a && b ? std::max(a, b) : std::nullopt;
+}
+
+// A toe below the ankle or missing says nothing.
+double FootOff(const Vec3& foot, const BodyStance& stance)
+{
+    constexpr double kAhead = 0.5; // sine of the angle from the trunk
+    const Vec3 ahead = Across(foot, stance.up);
+    return Vec3Length(ahead) <= kAhead * Vec3Length(foot) ? 0.0 : AngleBetween(ahead, stance.forward);
+}
+
+} // namespace
+
+ERestPose BodyStance::Verdict() const
+{
+    if (!armsSide)
+        return ERestPose::Unknown;
+    if (thighs && !Stands())
+        return ERestPose::None;
+    if (*armsSide <= kMostOfTPose)
+        return ERestPose::TPose;
+    if (armsDown && *armsDown <= kMostOfArmsDown)
+        return ERestPose::ArmsDown;
+    return *armsSide <= kMostOfAPose ? ERestPose::APose : ERestPose::Other;
+}
+
+bool BodyStance::Stands() const
+{
+    return thighs && *thighs <= kMostOfStance;
+}
+
+BodyStance StanceOf(const CBodyMap& body, const JointPlaces& places)
+{
+    const auto way = [&](const CNode* from, const CNode* to) {
+        return from && to ? places(*to) - places(*from) : kVec3Zero;
+    };
+    const auto ofLegs = [&](CNode* BodyLeg::*from, CNode* BodyLeg::*to) {
+        return Ways{way(body.legs[0].*from, body.legs[0].*to), way(body.legs[1].*from, body.legs[1].*to)};
+    };
+    const auto ofArm = [&](const BodyArm& arm) {
+        return way(arm.upperArm, arm.hand ? arm.hand : arm.forearm);
+    };
+    const CNode* const chest = body.spine.empty() ? nullptr : body.spine.back();
+    const Vec3 shoulders = way(body.arms[1].upperArm, body.arms[0].upperArm);
+    const Ways arms{ofArm(body.arms[0]), ofArm(body.arms[1])};
+    const Ways thighs = ofLegs(&BodyLeg::thigh, &BodyLeg::shin);
+    const Ways feet = ofLegs(&BodyLeg::foot, &BodyLeg::toe);
+    BodyStance stance;
+    stance.up = Vec3Normalized(way(body.hip, body.head ? body.head : chest));
+    stance.left = Vec3Normalized(Across(way(body.legs[1].thigh, body.legs[0].thigh), stance.up));
+    stance.forward = Vec3Cross(stance.left, stance.up);
+    const Vec3 down = -stance.up;
+    stance.thighs = Larger(thighs, down, down);
+    stance.apart = Between(thighs[0], thighs[1]);
+    stance.shins = Larger(ofLegs(&BodyLeg::shin, &BodyLeg::foot), down, down);
+    stance.feet = std::max(FootOff(feet[0], stance), FootOff(feet[1], stance));
+    stance.shoulders = Between(shoulders, stance.left);
+    stance.armsSide = Larger(arms, shoulders, -shoulders);
+    stance.armsDown = Larger(arms, down, down);
+    return stance;
+}
+
+BodyStance RestStanceOf(const CBodyMap& body)
+{
+    return StanceOf(body, RestPlace);
+}
+
+std::string_view RestPoseName(ERestPose pose)
+{
+    return kRestPoseNames[static_cast<size_t>(pose)];
+}
+
+} // namespace gw
