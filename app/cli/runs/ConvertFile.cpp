@@ -86,7 +86,12 @@ public:
             return EConversion::Failed;
         if (m_kOptions.dryRun)
             return EConversion::Planned;
-        if (!Convert() || !Save())
+        if (!Convert())
+            return EConversion::Failed;
+        // Another run may have made it meanwhile, such as the workers of one that was killed.
+        if (m_kOptions.skipExisting && IsTaken(m_kJob.output))
+            return EConversion::Skipped;
+        if (!Save())
             return EConversion::Failed;
         if (IsMeasured())
             Check();
