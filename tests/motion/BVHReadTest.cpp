@@ -233,7 +233,11 @@ TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)
     ASSERT_TRUE(file.loaded);
     CNode* const joint = FindNode(file.motion.motionRoot.Get(), "J");
     const auto& keys = static_cast<CKeyframeControl*>(joint->GetControl())->m_kPositionKeys;
-    EXPECT_EQ(keys, (std::vector<Vec3>{{1, 2, 0}, {3, 4, 0}, {5, 0, 0}}));
+    EXPECT_EQ(keys, (std::vector<Vec3>{
+                        {1, 2, 0},
+                        {3, 4, 0},
+                        {5, 0, 0}
+    }));
     EXPECT_EQ(file.motion.GetKeyCount(), 3);
 }
 

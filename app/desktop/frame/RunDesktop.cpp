@@ -1,6 +1,5 @@
 #include "RunDesktop.h"
 
-#include "DesktopArguments.h"
 #include "CFilePlatform.h"
 #include "CGaitConvertFrame.h"
 #include "CInstanceCounter.h"
@@ -9,6 +8,7 @@
 #include "CMessageBox.h"
 #include "CPreviewWidget.h"
 #include "CSkin.h"
+#include "DesktopArguments.h"
 #include "Paths.h"
 #include "QuitOnSignals.h"
 #include "RunMapTool.h"

@@ -48,7 +48,8 @@ bool MovesAgainstParent(const CNode& node)
 {
     const CKeyframeControl* track = RecordCast<CKeyframeControl>(node.GetControl());
     const Vec3 rest = track ? track->m_kRestMatrix.Translation() : kVec3Zero;
-    return track && std::ranges::any_of(track->m_kPositionKeys.Distinct(), [&](const Vec3& key) { return key != rest; });
+    return track && std::ranges::any_of(track->m_kPositionKeys.Distinct(),
+                                        [&](const Vec3& key) { return key != rest; });
 }
 
 // Takes a tree in rest pose. Bones are collected in the order of the rows.
