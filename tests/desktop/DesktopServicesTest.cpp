@@ -1,8 +1,8 @@
 // What the desktop is asked to show. A script stands for the programs that open things, an object on the
 // session's bus for the file manager.
 
-#include "CDialogAnswers.h"
 #include "DesktopServices.h"
+#include "CDialogAnswers.h"
 #include "Paths.h"
 #include "TempFolder.h"
 
