@@ -15,7 +15,6 @@
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QTest>
-#include <QTimer>
 #include <QUrl>
 #include <gtest/gtest.h>
 
@@ -23,9 +22,7 @@ namespace gw {
 
 namespace {
 
-constexpr int kPatience = 5'000; // milliseconds
-constexpr int kLookInterval = 20;
-constexpr int kHumanClick = 120;
+constexpr int kHumanClick = 120; // milliseconds
 
 Qt::KeyboardModifier ModifierOf(EKey key)
 {
@@ -59,9 +56,10 @@ CPerson::CPerson()
     Start();
 }
 
+// What was queued finds everything as it was.
 CPerson::~CPerson()
 {
-    EXPECT_EQ(m_kAnswers.size(), 0u) << "a window that was expected never came up";
+    Wait(0);
 }
 
 void CPerson::Start()
@@ -69,8 +67,7 @@ void CPerson::Start()
     m_spPlatform = std::make_unique<CFilePlatform>(EPlatformWriting::Yes);
     m_spFrame = std::make_unique<CGaitConvertFrame>(m_kSkin, m_kKeys, *m_spPlatform);
     m_spFrame->show();
-    m_spFrame->activateWindow();
-    EXPECT_TRUE(QTest::qWaitForWindowExposed(m_spFrame.get()));
+    Activate(*m_spFrame);
 }
 
 void CPerson::Restart()
@@ -112,13 +109,6 @@ void CPerson::Click(const char* name)
     QTest::mouseClick(Child(name), Qt::LeftButton);
 }
 
-// The toolkit's own wait takes a window for active while its owner is.
-void CPerson::Activate(QWidget& window)
-{
-    window.activateWindow();
-    EXPECT_TRUE(WaitUntil([&] { return QApplication::activeWindow() == &window; }));
-}
-
 void CPerson::ClickSlowly(const char* name)
 {
     Qt::KeyboardModifiers modifiers;
@@ -149,6 +139,7 @@ void CPerson::ReleaseLeft(EKey key, QWidget* window)
 
 void CPerson::Type(int key, Qt::KeyboardModifiers modifiers)
 {
+    Activate(*m_spFrame);
     QTest::keyClick(m_spFrame->windowHandle(), static_cast<Qt::Key>(key), modifiers);
 }
 
@@ -175,7 +166,7 @@ void CPerson::ChooseProfile(const QString& name)
 
 void CPerson::WillAnswer(const char* button)
 {
-    m_kAnswers.push_back([this, name = QString::fromLatin1(button)](QWidget& dialog) {
+    m_kAnswers.Add([this, name = QString::fromLatin1(button)](QWidget& dialog) {
         auto* const found = dialog.findChild<QPushButton*>(name);
         if (!found)
             return false;
@@ -187,12 +178,11 @@ void CPerson::WillAnswer(const char* button)
         QTest::mouseClick(found, Qt::LeftButton);
         return true;
     });
-    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
 }
 
 void CPerson::WillChooseFile(const std::string& path)
 {
-    m_kAnswers.push_back([path](QWidget& dialog) {
+    m_kAnswers.Add([path](QWidget& dialog) {
         auto* const files = dynamic_cast<QFileDialog*>(&dialog);
         if (!files)
             return false;
@@ -205,12 +195,11 @@ void CPerson::WillChooseFile(const std::string& path)
         QMetaObject::invokeMethod(files, "accept");
         return true;
     });
-    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
 }
 
 void CPerson::WillChooseFolder(const std::string& folder, int filter)
 {
-    m_kAnswers.push_back([folder, filter](QWidget& dialog) {
+    m_kAnswers.Add([folder, filter](QWidget& dialog) {
         auto* const edit = dialog.findChild<QLineEdit*>(QStringLiteral("102"));
         if (!edit)
             return false;
@@ -220,34 +209,6 @@ void CPerson::WillChooseFolder(const std::string& folder, int filter)
         QMetaObject::invokeMethod(&dialog, "accept");
         return true;
     });
-    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
-}
-
-// Looks again and again: the window comes up some time, perhaps within a nested loop of events.
-void CPerson::AnswerNext()
-{
-    QWidget* const dialog = QApplication::activeModalWidget();
-    if (dialog && dialog->isVisible() && !m_kAnswers.empty())
-    {
-        // Taken first: clicking may run the next window's loop before it returns.
-        const Answer answer = m_kAnswers.front();
-        m_kAnswers.erase(m_kAnswers.begin());
-        if (answer(*dialog))
-            return;
-        if (++m_iWrongLooks * kLookInterval > kPatience)
-        {
-            ADD_FAILURE() << "another window came up than was expected: " << ToUtf8(dialog->windowTitle());
-            dialog->close();
-            return;
-        }
-        m_kAnswers.insert(m_kAnswers.begin(), answer);
-    }
-    QTimer::singleShot(kLookInterval, m_spFrame.get(), [this] { AnswerNext(); });
-}
-
-bool CPerson::WaitUntil(const std::function<bool()>& holds)
-{
-    return QTest::qWaitFor(holds, kPatience);
 }
 
 void CPerson::Wait(int milliseconds)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CDialogAnswers.h"
 #include "CFilePlatform.h"
 #include "CGaitConvertContent.h"
 #include "CGaitConvertFrame.h"
@@ -9,7 +10,6 @@
 
 #include <QImage>
 #include <QString>
-#include <functional>
 #include <memory>
 #include <string>
 
@@ -48,7 +48,6 @@ public:
     /// What a view shows.
     QImage Picture(const char* view);
 
-    void Activate(QWidget& window);
     void Click(const char* name);
     /// Clicks as a person does: the press takes its time and activates the main window, if another one was
     /// active.
@@ -69,21 +68,15 @@ public:
     void WillChooseFile(const std::string& path);
     /// The folder chooser: types a folder, selects a filter from 1 on, accepts.
     void WillChooseFolder(const std::string& folder, int filter);
-    /// The texts of the message boxes that came up, and how many answers are still to be given.
+    /// The texts of the message boxes that came up.
     QStringList m_kBoxes;
     QString m_kDetails;       ///< of the last one
     bool m_bUnfolded = false; ///< whether they could be seen at once
-    size_t AnswersLeft() const { return m_kAnswers.size(); }
 
-    /// Lets the program run until something holds; false after five seconds.
-    bool WaitUntil(const std::function<bool()>& holds);
     void Wait(int milliseconds);
 
 private:
-    using Answer = std::function<bool(QWidget& dialog)>;
-
     void Start();
-    void AnswerNext();
 
     CTempHome m_kHome;
     std::unique_ptr<CFilePlatform> m_spPlatform;
@@ -91,8 +84,7 @@ private:
     CLeftKeys m_kKeys{[this] { return m_kHeld; }};
     CSkin m_kSkin;
     std::unique_ptr<CGaitConvertFrame> m_spFrame;
-    std::vector<Answer> m_kAnswers;
-    int m_iWrongLooks = 0; // at windows that were not expected
+    CDialogAnswers m_kAnswers;
 };
 
 /// The path of an example motion of the project's own.

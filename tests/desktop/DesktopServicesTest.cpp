@@ -2,6 +2,7 @@
 // session's bus for the file manager.
 
 #include "DesktopServices.h"
+#include "CDialogAnswers.h"
 #include "Paths.h"
 #include "TempFolder.h"
 
@@ -52,7 +53,7 @@ protected:
     // What was opened since the last call.
     static std::string Opened()
     {
-        EXPECT_TRUE(QTest::qWaitFor([] { return FileExists(OpenedFile()); }));
+        EXPECT_TRUE(WaitUntil([] { return FileExists(OpenedFile()); }));
         const std::string opened = ReadBytes(OpenedFile());
         DeleteFile(OpenedFile());
         return opened;
@@ -88,7 +89,7 @@ TEST_F(DesktopServices, ShowTheFileInTheFileManager)
         GTEST_SKIP() << "no session bus, or one with a file manager of its own";
     bus.registerVirtualObject(QStringLiteral("/org/freedesktop/FileManager1"), &manager);
     ShowInFileManager("/takes/walk #1.htr");
-    EXPECT_TRUE(QTest::qWaitFor([&] { return !manager.m_kShown.isEmpty(); }));
+    EXPECT_TRUE(WaitUntil([&] { return !manager.m_kShown.isEmpty(); }));
     EXPECT_EQ(manager.m_kShown, QStringList(QStringLiteral("file:///takes/walk%20%231.htr")));
     QTest::qWait(50);
     EXPECT_FALSE(FileExists(OpenedFile())); // not the folder as well

@@ -4,7 +4,6 @@
 
 #include <QApplication>
 #include <QTest>
-#include <QTimer>
 
 namespace gw {
 
@@ -21,11 +20,17 @@ EditorTest::EditorTest()
     m_kWindow.m_kOnBoneOffset = [this](CBoneOffsetDialog& dialog) { return m_kEditor.RunBoneOffset(dialog); };
 }
 
+// What was queued finds everything as it was.
+EditorTest::~EditorTest()
+{
+    Settle();
+}
+
 void EditorTest::OpenEditor()
 {
     Open(Write("walk.bvh", BvhText(kPoserBones)));
     Toggle(true);
-    ASSERT_TRUE(QTest::qWaitForWindowActive(&m_kEditor));
+    Activate(m_kEditor);
     m_kWindow.TakeCalls();
 }
 
@@ -39,6 +44,7 @@ void EditorTest::Toggle(bool shown)
 void EditorTest::Type(int field, const char* text)
 {
     auto& edit = Child<QLineEdit>(field);
+    Activate(m_kEditor);
     edit.setFocus();
     edit.selectAll();
     QTest::keyClicks(&edit, QString::fromUtf8(text));
@@ -46,6 +52,7 @@ void EditorTest::Type(int field, const char* text)
 
 void EditorTest::Press(Qt::Key key, Qt::KeyboardModifiers modifiers)
 {
+    Activate(m_kEditor);
     QTest::keyClick(QApplication::focusWidget(), key, modifiers);
     Settle();
 }
@@ -83,19 +90,13 @@ void EditorTest::DoubleClickRow(int row)
     Settle();
 }
 
-void EditorTest::InOffsetDialog(std::function<void(QWidget& dialog)> actions)
+void EditorTest::InOffsetDialog(const std::function<void(QWidget& dialog)>& actions)
 {
-    QTimer::singleShot(1, &m_kEditor, [this, actions = std::move(actions)] {
-        QWidget* const dialog = QApplication::activeModalWidget();
-        if (!dialog)
-        {
-            InOffsetDialog(actions);
-            return;
-        }
-        EXPECT_TRUE(QTest::qWaitFor([=] { return QApplication::activeWindow() == dialog; }));
-        actions(*dialog);
-        EXPECT_FALSE(dialog->isVisible()) << "the person has to end it";
-        dialog->close();
+    m_kAnswers.Add([actions](QWidget& dialog) {
+        actions(dialog);
+        EXPECT_FALSE(dialog.isVisible()) << "the person has to end it";
+        dialog.close();
+        return true;
     });
 }
 

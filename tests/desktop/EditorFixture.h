@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CBoneTreeView.h"
+#include "CDialogAnswers.h"
 #include "CMapRowView.h"
 #include "CProfileEditorDialog.h"
 #include "CProfileEditorWindow.h"
@@ -20,6 +21,7 @@ class EditorTest : public ContentTest
 {
 protected:
     EditorTest();
+    ~EditorTest() override;
 
     /// Opens a source that the stock profile "Poser" fits, and then the editor.
     void OpenEditor();
@@ -35,7 +37,7 @@ protected:
     void ClickRow(int row, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void DoubleClickRow(int row);
     /// What the person will do in the offset dialog once it opens.
-    void InOffsetDialog(std::function<void(QWidget& dialog)> actions);
+    void InOffsetDialog(const std::function<void(QWidget& dialog)>& actions);
 
     // What the person sees
     template <class Widget>
@@ -64,6 +66,7 @@ protected:
 
     QWidget m_kOwner; ///< stands for the main window
     CProfileEditorWindow m_kEditor{m_kContent, m_kPlatform, &m_kOwner};
+    CDialogAnswers m_kAnswers;
 };
 
 /// Lets the window take up what was sent and queued.

@@ -38,8 +38,8 @@ TEST_F(EditorRows, TheOpenProfileStandsInTheWindow)
 {
     EXPECT_EQ(Field(kNameField), "Poser");
     EXPECT_EQ(Field(kFrameRateField), "30");
+    ASSERT_EQ(Rows().size(), 9u);
     EXPECT_EQ(Rows().front(), kHipRow);
-    EXPECT_EQ(Rows().size(), 9u);
     EXPECT_THAT(Bones(kSourceTree),
                 ElementsAre("hip", "lThigh", "lShin", "lFoot", "rThigh", "rShin", "rFoot"));
     EXPECT_TRUE(IsEnabled(kRemoveAllButton));

@@ -1,5 +1,6 @@
 // A second start brings the first window to the front, and nothing else that knocks does any harm.
 
+#include "CDialogAnswers.h"
 #include "CInstanceServer.h"
 #include "InstanceMessage.h"
 #include "TempFolder.h"
@@ -161,7 +162,7 @@ TEST_F(Instances, ARequestMayComeInPieces)
         caller.flush();
         QTest::qWait(1);
     }
-    EXPECT_TRUE(QTest::qWaitFor([&] { return !m_kRaised.empty(); }));
+    EXPECT_TRUE(WaitUntil([&] { return !m_kRaised.empty(); }));
     EXPECT_THAT(m_kRaised, ElementsAre("/walk.bvh"));
 }
 

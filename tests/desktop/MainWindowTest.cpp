@@ -12,7 +12,6 @@
 #include <QSlider>
 #include <QSurfaceFormat>
 #include <QTest>
-#include <QTimer>
 #include <fstream>
 #include <gmock/gmock.h>
 #include <sstream>
@@ -56,11 +55,8 @@ bool ShowsSomething(const QImage& picture)
 void ChooseOption(CPerson& person, int row)
 {
     person.Click("options");
-    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
-    auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
-    QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
-                      menu->actionGeometry(menu->actions()[row]).center());
-    ASSERT_TRUE(person.WaitUntil([] { return !QApplication::activePopupWidget(); }));
+    ClickInMenu(row);
+    ASSERT_TRUE(WaitUntil([] { return !QApplication::activePopupWidget(); }));
 }
 
 // The example's motion with names that say nothing.
@@ -105,9 +101,9 @@ TEST(MainWindow, AMotionIsOpenedConvertedPlayedAndSaved)
     EXPECT_TRUE(ShowsSomething(first));
 
     person.Type(Qt::Key_Space);
-    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) > 40; }));
-    EXPECT_NE(person.Picture("#cnt2"), first);
+    EXPECT_TRUE(WaitUntil([&] { return ScrollValue(person) > 40; }));
     person.Type(Qt::Key_Space);
+    EXPECT_NE(person.Picture("#cnt2"), first);
     const int paused = ScrollValue(person);
     person.Wait(60);
     EXPECT_EQ(ScrollValue(person), paused);
@@ -137,8 +133,8 @@ TEST(MainWindow, TheBarHoldsTheClockWhileItIsDragged)
     person.Wait(80);
     EXPECT_EQ(ScrollValue(person), 128);
     QTest::mouseRelease(bar, Qt::LeftButton, Qt::NoModifier, middle);
-    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) > 140; })) << "plays on";
-    EXPECT_TRUE(person.WaitUntil([&] { return ScrollValue(person) == 0; })) << "and stops at the start";
+    EXPECT_TRUE(WaitUntil([&] { return ScrollValue(person) > 140; })) << "plays on";
+    EXPECT_TRUE(WaitUntil([&] { return ScrollValue(person) == 0; })) << "and stops at the start";
 }
 
 TEST(MainWindow, TheResultAlonePlaysOnlyWithTheClockOfBoth)
@@ -152,7 +148,7 @@ TEST(MainWindow, TheResultAlonePlaysOnlyWithTheClockOfBoth)
     person.Wait(150);
     EXPECT_EQ(person.Picture("#cnt2"), still);
     person.Click("play");
-    EXPECT_TRUE(person.WaitUntil([&] { return person.Picture("#cnt2") != still; }));
+    EXPECT_TRUE(WaitUntil([&] { return person.Picture("#cnt2") != still; }));
 }
 
 TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
@@ -165,12 +161,12 @@ TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
 
     person.WillAnswer("cancel");
     person.Click("exit");
-    EXPECT_TRUE(person.WaitUntil([&] { return person.m_kBoxes.size() == 2; }));
+    EXPECT_TRUE(WaitUntil([&] { return person.m_kBoxes.size() == 2; }));
     EXPECT_TRUE(person.Frame().isVisible());
 
     person.WillAnswer("no");
     person.Click("close");
-    EXPECT_TRUE(person.WaitUntil([&] { return !person.Frame().isVisible(); }));
+    EXPECT_TRUE(WaitUntil([&] { return !person.Frame().isVisible(); }));
     EXPECT_EQ(person.m_kBoxes, QStringList(3, QStringLiteral("Save convertion result?")));
 }
 
@@ -241,7 +237,7 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     person.ChooseProfile(QStringLiteral("Poser BVH"));
     person.Click("%adv");
     auto* const editor = person.Frame().findChild<QWidget*>(QStringLiteral("profileEditor"));
-    person.Activate(*editor);
+    Activate(*editor);
     const struct
     {
         const char* what;
@@ -254,7 +250,7 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.what);
-        person.Activate(row.pressedOver ? *row.pressedOver : *editor);
+        Activate(row.pressedOver ? *row.pressedOver : *editor);
         person.m_kBoxes.clear();
         person.WillChooseFolder(folder, 1);
         person.WillAnswer("ok");
@@ -296,11 +292,8 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     EXPECT_EQ(person.Content().RecentFiles().size(), 2u);
     person.Restart();
     QTest::mousePress(person.Child("face"), Qt::LeftButton, Qt::NoModifier, QPoint(3, 3));
-    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
-    auto* const menu = static_cast<QMenu*>(QApplication::activePopupWidget());
-    QTest::mouseClick(menu, Qt::LeftButton, Qt::NoModifier,
-                      menu->actionGeometry(menu->actions()[1]).center());
-    EXPECT_TRUE(person.WaitUntil([&] { return person.IsOn("convert"); }));
+    ClickInMenu(1);
+    EXPECT_TRUE(WaitUntil([&] { return person.IsOn("convert"); }));
 
     const std::string broken = person.Home().Path("broken.bvh");
     WriteBytes(broken, "HIERARCHY\nnothing");
@@ -345,7 +338,7 @@ TEST(MainWindow, ABoneMapIsDraftedForASourceThatNoneFits)
     person.Click("convert");
     EXPECT_FALSE(person.Content().IsConverted());
     ChooseOption(person, kDraft);
-    ASSERT_TRUE(person.WaitUntil([&] { return person.Content().ProfileEditor()->IsVisible(); }));
+    ASSERT_TRUE(WaitUntil([&] { return person.Content().ProfileEditor()->IsVisible(); }));
     EXPECT_EQ(static_cast<QComboBox*>(person.Child("#format"))->currentText(), QStringLiteral("nameless"));
     person.Click("convert");
     EXPECT_TRUE(person.Content().IsConverted());
@@ -358,12 +351,13 @@ TEST(MainWindow, ASecondClickOnTheCornerCloses)
     CPerson person;
     auto* const face = person.Child("face");
     QTest::mousePress(face, Qt::LeftButton, Qt::NoModifier, QPoint(3, 3));
-    ASSERT_TRUE(person.WaitUntil([] { return QApplication::activePopupWidget() != nullptr; }));
+    QMenu* const menu = OpenMenu();
+    ASSERT_TRUE(menu);
     const QPoint corner = face->mapToGlobal(QPoint(3, 3));
     QMouseEvent again(QEvent::MouseButtonPress, QPointF(), corner, Qt::LeftButton, Qt::LeftButton,
                       Qt::NoModifier);
-    QApplication::sendEvent(QApplication::activePopupWidget(), &again);
-    EXPECT_TRUE(person.WaitUntil([&] { return !person.Frame().isVisible(); }));
+    QApplication::sendEvent(menu, &again);
+    EXPECT_TRUE(WaitUntil([&] { return !person.Frame().isVisible(); }));
 }
 
 TEST(MainWindow, StandsWhereItWasClosedUnlessThatIsOffTheScreen)
@@ -391,12 +385,11 @@ TEST(PreviewWidget, SaysThatItsPixelFormatIsMissing)
     QSurfaceFormat unknown = usual;
     unknown.setRenderableType(QSurfaceFormat::OpenVG);
     QSurfaceFormat::setDefaultFormat(unknown);
-    QTimer::singleShot(0, qApp, [] {
-        QWidget* const box = QApplication::activeModalWidget();
-        EXPECT_EQ(box->windowTitle(), QStringLiteral("Error"));
-        EXPECT_EQ(box->findChild<QLabel*>(QStringLiteral("text"))->accessibleName(),
+    const CDialogAnswers answers([](QWidget& box) {
+        EXPECT_EQ(box.windowTitle(), QStringLiteral("Error"));
+        EXPECT_EQ(box.findChild<QLabel*>(QStringLiteral("text"))->accessibleName(),
                   QStringLiteral("ChoosePixelFormat failed"));
-        box->close();
+        box.close();
     });
     const CLeftKeys keys;
     CPreviewWidget(keys, nullptr).MakeView();

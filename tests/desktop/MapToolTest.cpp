@@ -1,5 +1,6 @@
 // Stories of a person at the map tool's window.
 
+#include "CDialogAnswers.h"
 #include "CGaitToolWindow.h"
 #include "CLeftKeys.h"
 #include "CPreviewWidget.h"
@@ -17,7 +18,6 @@
 #include <QPushButton>
 #include <QSpinBox>
 #include <QTest>
-#include <QTimer>
 #include <QTreeWidget>
 #include <QUrl>
 
@@ -34,8 +34,7 @@ protected:
         Write("map.txt",
               "Walk\nPosition 0,0,0\nFrameRate 60\nhip <---> LowerTorso .\nlThigh <---> LThigh 1,2,3\n");
         m_kTool.show();
-        m_kTool.activateWindow();
-        EXPECT_TRUE(QTest::qWaitForWindowActive(&m_kTool));
+        Activate(m_kTool);
     }
 
     template <class T>
@@ -50,15 +49,9 @@ protected:
     template <class F>
     void ClickAnd(const char* button, F answer) const
     {
-        bool wasThere = false;
-        QTimer::singleShot(0, [&] {
-            auto* const dialog = qobject_cast<QDialog*>(QApplication::activeModalWidget());
-            wasThere = dialog != nullptr;
-            if (dialog)
-                answer(*dialog);
-        });
+        SCOPED_TRACE(button);
+        const CDialogAnswers answers([&](QWidget& dialog) { answer(dynamic_cast<QDialog&>(dialog)); });
         Click(button);
-        EXPECT_TRUE(wasThere) << button;
     }
     /// Clicks a button and gives its file dialog a file of the temporary folder.
     void ClickFile(const char* button, const std::string& file) const
@@ -100,7 +93,7 @@ protected:
     CGaitToolWindow m_kTool{m_kPlatform, m_kKeys};
 };
 
-void Press(const QDialog& dialog, const char* text)
+void Press(const QWidget& dialog, const char* text)
 {
     for (QPushButton* button : dialog.findChildren<QPushButton*>())
     {
@@ -161,6 +154,7 @@ TEST_F(MapToolTest, APairOfBonesBecomesALine)
     EXPECT_EQ(SelectedBone("sourceTree"), QStringLiteral("hip")) << "the trees stay where the user put them";
     SelectLine(3);
     EXPECT_EQ(SelectedBone("sourceTree") + SelectedBone("targetTree"), QStringLiteral("rThighRThigh"));
+    Activate(m_kTool);
     QTest::keyClick(Child<QListView>("1008"), Qt::Key_Delete);
     EXPECT_EQ(Line(3), QStringLiteral("hip <---> LowerTorso ."));
 }
@@ -254,22 +248,21 @@ TEST_F(MapToolTest, FilesThatAreNoMapOrMotionAreSaidBesideTheWindow)
 TEST_F(MapToolTest, TheWindowMenuOpensTheAboutBox)
 {
     Click("menuButton");
-    auto* const menu = qobject_cast<QMenu*>(QApplication::activePopupWidget());
-    ASSERT_NE(menu, nullptr);
+    const QMenu* const menu = OpenMenu();
+    ASSERT_TRUE(menu);
     const QList<QAction*> entries = menu->actions();
     ASSERT_EQ(entries.size(), 3);
     EXPECT_TRUE(entries[1]->isSeparator());
     EXPECT_EQ(entries[2]->text(), QStringLiteral("About GaitTool(&A)..."));
     QStringList words;
-    QTimer::singleShot(0, [&] {
-        const auto* const box = qobject_cast<QDialog*>(QApplication::activeModalWidget());
-        ASSERT_NE(box, nullptr);
-        for (const QLabel* label : box->findChildren<QLabel*>())
+    const CDialogAnswers answers([&](QWidget& box) {
+        for (const QLabel* label : box.findChildren<QLabel*>())
             words << label->text();
-        Press(*box, "OK");
+        Press(box, "OK");
     });
-    QTest::mouseClick(menu, Qt::LeftButton, {}, menu->actionGeometry(entries[2]).center());
+    ClickInMenu(2);
     EXPECT_EQ(words, (QStringList{QStringLiteral("GaitTool"), QStringLiteral("Gaitwright v2.0")}));
+    Activate(m_kTool);
     QTest::keyClick(&m_kTool, Qt::Key_Escape);
     EXPECT_TRUE(m_kTool.isVisible()) << "the Escape key loses no map";
     Click("1");
@@ -279,11 +272,9 @@ TEST_F(MapToolTest, TheWindowMenuOpensTheAboutBox)
 TEST_F(MapToolTest, TheProgramRunsUntilTheToolIsClosed)
 {
     m_kTool.hide();
-    QTimer::singleShot(0, [] {
-        auto* const tool = QApplication::activeModalWidget();
-        ASSERT_NE(tool, nullptr);
-        EXPECT_EQ(tool->windowTitle(), QStringLiteral("GaitTool"));
-        tool->findChild<QPushButton*>(QStringLiteral("1"))->click();
+    const CDialogAnswers answers([](QWidget& tool) {
+        EXPECT_EQ(tool.windowTitle(), QStringLiteral("GaitTool"));
+        tool.findChild<QPushButton*>(QStringLiteral("1"))->click();
     });
     EXPECT_EQ(RunMapTool(m_kPlatform, m_kKeys), 0);
 }

@@ -1,5 +1,6 @@
 // Questions and words: what each set of buttons answers to hand, keyboard and close box.
 
+#include "CDialogAnswers.h"
 #include "CMessageBox.h"
 
 #include <QAbstractButton>
@@ -9,7 +10,6 @@
 #include <QPlainTextEdit>
 #include <QScreen>
 #include <QTest>
-#include <QTimer>
 #include <functional>
 #include <gtest/gtest.h>
 
@@ -22,11 +22,7 @@ using Act = std::function<void(QWidget&)>;
 EAnswer Ask(EButtons buttons, const Act& act, const std::string& text = "Text",
             const std::string& details = {})
 {
-    QTimer::singleShot(0, qApp, [&] {
-        QWidget* box = QApplication::activeModalWidget();
-        ASSERT_TRUE(box && QTest::qWaitForWindowActive(box));
-        act(*box);
-    });
+    const CDialogAnswers answers(act);
     return RunMessageBox(nullptr, "Caption", text, buttons, details);
 }
 
@@ -129,13 +125,13 @@ TEST(MessageBox, DetailsFoldOutUnderTheTextAndScroll)
             auto* text = box.findChild<QPlainTextEdit*>();
             EXPECT_FALSE(text->isVisible() || Button(box, "copy")->isVisible());
             Press("details")(box);
-            EXPECT_TRUE(QTest::qWaitFor([&] { return box.height() > folded + 100; }));
+            EXPECT_TRUE(WaitUntil([&] { return box.height() > folded + 100; }));
             EXPECT_LE(box.height(), box.screen()->availableSize().height() * 6 / 10 + 1);
             ExpectAllInside(box);
             Press("copy")(box);
             EXPECT_EQ(QApplication::clipboard()->text().toStdString(), details);
             Press("details")(box);
-            EXPECT_TRUE(QTest::qWaitFor([&] { return box.height() == folded; }));
+            EXPECT_TRUE(WaitUntil([&] { return box.height() == folded; }));
             box.close();
         },
         "Text", details);

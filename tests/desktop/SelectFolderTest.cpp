@@ -1,17 +1,16 @@
 // Choosing a folder, by hand and by its path.
 
+#include "CDialogAnswers.h"
 #include "CSelectFolderDialog.h"
 #include "Paths.h"
 #include "TempFolder.h"
 
 #include <QAbstractButton>
 #include <QAbstractItemView>
-#include <QApplication>
 #include <QComboBox>
 #include <QLabel>
 #include <QLineEdit>
 #include <QTest>
-#include <QTimer>
 #include <gtest/gtest.h>
 
 namespace gw {
@@ -38,8 +37,7 @@ protected:
         m_pkDialog = std::make_unique<CSelectFolderDialog>(
             nullptr, CFileDialogSetup{{}, filter, initial.empty() ? m_kFolder.Path() : initial});
         m_pkDialog->show();
-        m_pkDialog->activateWindow(); // the screen of the tests has no window manager
-        EXPECT_TRUE(QTest::qWaitForWindowActive(m_pkDialog.get()));
+        Activate(*m_pkDialog);
         return *m_pkDialog;
     }
 
@@ -77,7 +75,7 @@ protected:
             }
             return names == expected;
         };
-        (void)QTest::qWaitFor(read);
+        (void)WaitUntil(read);
         return names;
     }
     void ExpectListed(const std::vector<std::string>& expected) { EXPECT_EQ(Listed(expected), expected); }
@@ -86,11 +84,9 @@ protected:
     std::string SelectAndAnswer(const char* button)
     {
         std::string text;
-        QTimer::singleShot(0, qApp, [&] {
-            QWidget* box = QApplication::activeModalWidget();
-            ASSERT_TRUE(box);
-            text = box->findChild<QLabel*>(QStringLiteral("text"))->accessibleName().toStdString();
-            QTest::mouseClick(box->findChild<QWidget*>(QLatin1String(button)), Qt::LeftButton);
+        const CDialogAnswers answers([&](QWidget& box) {
+            text = box.findChild<QLabel*>(QStringLiteral("text"))->accessibleName().toStdString();
+            QTest::mouseClick(box.findChild<QWidget*>(QLatin1String(button)), Qt::LeftButton);
         });
         Click("select");
         return text;
@@ -192,7 +188,7 @@ TEST_F(SelectFolder, TakesAMissingFolderWhateverIsAnsweredAndMakesNone)
 
 TEST_F(SelectFolder, AnswersNothingWhenItIsCancelled)
 {
-    QTimer::singleShot(0, qApp, [] { QTest::keyClick(QApplication::activeModalWidget(), Qt::Key_Escape); });
+    const CDialogAnswers answers([](QWidget& dialog) { QTest::keyClick(&dialog, Qt::Key_Escape); });
     EXPECT_FALSE(AskFolder(nullptr, {{}, kFilter, m_kFolder.Path("gone with a disk")}));
 }
 
