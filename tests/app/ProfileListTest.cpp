@@ -84,6 +84,10 @@ TEST_F(ContentTest, StockChoice)
         const bool isChosen = *row.after != '\0';
         EXPECT_TRUE(!isChosen || m_kContent.ProfilePath() == m_kContent.FindProfilePath(row.after));
     }
+    Write("data/PoserBVH.prf", "Poser\nFrameRate 30\n");
+    SelectProfile("Mine");
+    Open(Write("source.bvh", none));
+    EXPECT_EQ(SelectedProfile(), "Mine") << "a profile without rows fits nothing";
 }
 
 TEST_F(ContentTest, StockNamesAreThoseOfTheLastRefresh)
@@ -124,6 +128,9 @@ TEST_F(ContentTest, PruningPassesOverWhatSlidesIntoAPlace)
     m_kContent.PruneProfileList();
     EXPECT_EQ(Items(m_kWindow.m_kList),
               (std::vector<std::string>{"3DS MAX (stock)", "Poser (stock)", "Mine", "gone 2", "new"}));
+    m_kWindow.m_kList.SetCurSel(3);
+    m_kContent.PruneProfileList();
+    EXPECT_EQ(SelectedProfile(), "gone 2") << "the selected one stays";
 }
 
 TEST_F(ContentTest, AnUnsavedNameStandsInTheListAndCannotBeDeleted)

@@ -391,6 +391,19 @@ TEST_F(ToolTest, AConversionMovesTheResultAsTheLinesSay)
     EXPECT_GT(path.z, 0.0f) << "the source walks along Z";
 }
 
+TEST_F(ToolTest, AConversionAddsThePositionToWhereTheSkeletonStands)
+{
+    LoadSource(4);
+    const std::string rows = "|hip <---> LowerTorso .|";
+    LoadMap("Walk|Position 0,0,0" + rows);
+    Click(kToolConvert);
+    const Vec3 origin = ResultAt("LowerTorso", 0).Translation();
+    LoadMap("Walk|Position 1,2,3" + rows);
+    Click(kToolConvert);
+    EXPECT_LT(Vec3Length(ResultAt("LowerTorso", 0).Translation() - origin - Vec3{1, 2, 3}), 1e-3);
+    EXPECT_GT(Vec3Length(origin), 1.0);
+}
+
 // The page on map lines holds a map, and a table of what changes of its text do to a conversion.
 TEST_F(ToolTest, LinesDoWhatTheirPageSays)
 {

@@ -237,6 +237,23 @@ TEST_F(ContentTest, EveryConversionStartsFromTheTargetAsItIsOnTheDisk)
     }
 }
 
+TEST_F(ContentTest, AConversionTakesTheRowsAsTheyStandAndGoesBackToTheStart)
+{
+    OpenAndConvert();
+    SaveAs("saved rows.htr");
+    CProfileEditorDialog& editor = *m_kContent.ProfileEditor();
+    editor.SelectOnlyRow(1);
+    editor.ClickRow(1);
+    editor.ClickButton(kRemoveButton);
+    Do("click end");
+    EXPECT_GT(m_kWindow.m_pkSource->GetTime(), 0.0f);
+    m_kContent.ConvertMotion();
+    EXPECT_EQ(m_kWindow.m_pkSource->GetTime(), 0.0f);
+    SaveAs("unsaved rows.htr");
+    EXPECT_TRUE(editor.IsDirty());
+    EXPECT_NE(Read("unsaved rows.htr"), Read("saved rows.htr"));
+}
+
 TEST_F(ContentTest, TheRestPoseStandsWhereTheMotionBegins)
 {
     OpenAndConvert();

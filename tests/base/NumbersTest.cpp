@@ -1,15 +1,11 @@
 #include "Numbers.h"
 #include "ReadFloat.h"
 
-#include "TempFolder.h"
-
 #include <bit>
 #include <cfloat>
 #include <charconv>
-#include <clocale>
 #include <cmath>
 #include <cstdio>
-#include <cstdlib>
 #include <gtest/gtest.h>
 #include <iterator>
 #include <limits>
@@ -249,28 +245,6 @@ TEST(Numbers, FloatsPrintAsTheLibraryPrintsThem)
                                                 std::chars_format::fixed, 6);
         ASSERT_EQ(std::string_view(text, WriteFixed6(text, value)), std::string_view(expected, end));
     }
-}
-
-TEST(Numbers, TheLocaleOfTheDesktopHasNoSay)
-{
-    const CTempFolder folder;
-    const std::string command =
-        "localedef -i de_DE -f UTF-8 " + folder.Path("de_DE.UTF-8") + " >/dev/null 2>&1";
-    if (std::system(command.c_str()) != 0)
-        return;
-    setenv("LOCPATH", folder.Path().c_str(), 1);
-    if (std::setlocale(LC_ALL, "de_DE.UTF-8"))
-    {
-        EXPECT_EQ(Printed(1.5f), "1,500000"); // so that the rest says something
-        EXPECT_EQ(Fixed6(1234.5f), "1234.500000");
-        EXPECT_EQ(Fixed6(1e15f), "999999986991104.000000");
-        EXPECT_EQ(Fixed3(1234.5f), "1234.500");
-        EXPECT_EQ(ParseDouble("1.5e0"), 1.5);
-        EXPECT_EQ(ReadFront(CBlock("1.5")).value, 1.5f);
-        EXPECT_EQ(ReadFront(CBlock("1,5")).value, 1.0f);
-    }
-    std::setlocale(LC_ALL, "C");
-    unsetenv("LOCPATH");
 }
 
 } // namespace gw

@@ -154,16 +154,6 @@ class Containers(CliTest):
             self.assertEqual(self.run_program(*command).code, DONE)
         self.assertEqual(self.read("out.orn"), self.read("roots.orn"))
 
-    def test_every_beginning_of_a_scene_is_read_or_told_to_be_damaged(self):
-        whole = skeleton()
-        for end in range(0, len(whole), 11):
-            with self.subTest(end):
-                self.write("cut.orn", whole[:end])
-                result = self.run_program("resave", "cut.orn", "out.orn")
-                self.assertEqual(self.run_program("info", "cut.orn").code, result.code)
-                self.assertEqual((self.folder / "out.orn").exists(), result.code == DONE)
-                (self.folder / "out.orn").unlink(missing_ok=True)
-
     def test_a_package_holds_the_file_and_what_was_said_of_it(self):
         rows = [("take.htr", 3), ("take.HTR", 3), ("take.cha", 1), ("take.chb", 2), ("take.txt", 0)]
         for name, code in rows:

@@ -18,57 +18,30 @@ def nested(depth):
     return bvh("  JOINT Chest", inner + "  JOINT Chest")
 
 
+# A row for each form of a place; the readers' own tests have every cause.
 BROKEN = [  # what, content, line or 0, word of the sentence
     ("an empty file", "", 0, '"HIERARCHY"'),
     ("no BVH at all", "\x00\x01\x02" * 100, 1, '"HIERARCHY"'),
-    ("another text", "solid cube\nfacet\n", 2, '"HIERARCHY"'),
-    ("no motion section", BVH.split("MOTION")[0], 15, '"MOTION"'),
-    ("no root", BVH.replace("ROOT Hips", "JOINT Hips"), 2, "ROOT"),
-    ("an offset of two numbers", bvh("OFFSET 0 10 0", "OFFSET 0 10"), 8, "fewer values"),
-    ("an offset of words", bvh("OFFSET 0 10 0", "OFFSET a b c"), 8, "number"),
-    ("a name over 255 characters", bvh("Chest", "C" * 256), 6, "255"),
     ("a name that a zero byte ends", bvh("Chest", "\0Chest"), 6, "zero byte"),
     ("more channels than words", bvh("CHANNELS 3 Z", "CHANNELS 999999999 Z"), 9, "fewer values"),
-    ("an empty line before the frames", bvh("MOTION\n", "MOTION\n\n"), 17, "empty line"),
-    ("no frame time", bvh("Frame Time: 0.0333333\n", ""), 18, "Frame Time"),
-    ("a frame time of nothing", bvh("0.0333333", "0"), 18, "number"),
-    ("a frame time that is no number", bvh("0.0333333", "nan"), 18, "number"),
-    ("fewer rows than frames", bvh("Frames: 3", "Frames: 4"), 17, "fewer rows"),
-    ("more frames than any file has", bvh("Frames: 3", "Frames: 2000000000"), 17, "fewer rows"),
-    ("a row too short for the root", bvh(ROW, "1 90 0 0"), 20, "fewer values"),
-    ("a word in a row", bvh(ROW, "1 90 x 0 0 0 90 0 0"), 20, '"x"'),
     ("no number in a row", bvh(ROW, "1 90 nan 0 0 0 90 0 0"), 20, '"nan"'),
-    ("an infinity in a row", bvh(ROW, "1 90 0 0 0 0 -inf 0 0"), 20, '"-inf"'),
-    ("a number that no float holds", bvh(ROW, "1 90 0 0 0 0 1e39 0 0"), 20, '"1e39"'),
     ("a hundred thousand levels", nested(100000), 0, "deep"),
 ]
 
 BROKEN_HTR = [
-    ("an empty file", "", 0, "Hierarchy"),
     ("a ring of bones", htr("Hips GLOBAL", "Hips Chest"), 22, '"Hips"'),
-    ("a bone that is its own parent", htr("Chest Hips", "Chest Chest"), 26, '"Chest"'),
-    ("a name that a zero byte ends", htr("Chest Hips", "\0Chest Hips"), 17, "zero byte"),
-    ("more frames than any file has", htr("NumFrames 2", "NumFrames 2000000000"), 6, "NumFrames"),
-    ("no number in a row", htr("2 1 0 0 0 0 90 1", "2 nan 0 0 0 0 90 1"), 25, '"nan"'),
     ("an infinity in the rest pose", htr("Hips 0 90 0", "Hips 0 inf 0"), 20, '"inf"'),
 ]
 
 BROKEN_CHA = [
-    ("an empty file", "", 0, "[HIERARCHY]"),
-    ("an empty line too many", cha("\n\n", "\n\n\n"), 8, "empty line"),
     ("more segments than there can be", cha("Segments 2", "Segments 101"), 6, "limit"),
-    ("no bone hangs on anything", cha("Hips Global", "Hips Chest"), 14, "Global"),
-    ("more frames than any file has", cha("EndFrame 3", "EndFrame 2000000000"), 14, "fewer rows"),
     ("a file that is cut", CHA[:-60], 25, "fewer rows"),
-    ("no number in a row", cha("1, 2, 90", "1, nan, 90"), 22, '"nan"'),
 ]
 
 CHB_END = len(chb())
 BROKEN_CHB = [  # what, content, byte or 0, words
     ("an empty file", b"", 0, "middle of a record"),
-    ("another file", BVH, 0, "[HEADER]"),
     ("a version to come", chb(version=722), 25, "version"),
-    ("a file that is cut", chb()[:-1], CHB_END - 4, "middle of a record"),
     ("an infinity", chb()[:-4] + b"\0\0\x80\x7f", CHB_END, "number"),
 ]
 
@@ -78,16 +51,6 @@ WARNED = [  # what, content, code of the warning, line
     ("a number with something stuck to it", bvh(ROW, "1 90 0.0-7.5 0 0 0 90 0 0"), "stuck-number", 20),
     ("positions that repeat the offsets", DOUBLED, "doubled-offsets", None),
     ("a channel that there is not", bvh("CHANNELS 3 Zrotation", "CHANNELS 3 Wrotation"), "unknown-channel", 9),
-]
-
-STRANGE = [  # legal, and read without a word: what, content
-    ("line ends of another system", BVH.replace("\n", "\r\n")),
-    ("a byte order mark", "\ufeff" + BVH),
-    ("tabs and commas", bvh(ROW, ROW.replace(" ", "\t,"))),
-    ("no line end behind the last row", BVH.rstrip()),
-    ("two joints of one name", bvh("JOINT Chest", "JOINT Hips")),
-    ("rows behind the last frame", BVH + ROW + "\n"),
-    ("a name of bytes that are no UTF-8", BVH.encode().replace(b"Chest", b"Ch\xff\x1b[31mst")),
 ]
 
 
@@ -135,25 +98,6 @@ class Files(CliTest):
                 self.assertIn("warning: take.bvh", result.err)
                 self.assertEqual(self.run_program("info", "take.bvh", "--quiet").err, "")
 
-    def test_what_is_only_strange_is_read(self):
-        for what, content in STRANGE:
-            with self.subTest(what):
-                self.write("take.bvh", content)
-                result = self.run_program("pose", "take.bvh", "--frame", 1)
-                self.assertEqual((result.code, result.err), (DONE, ""))
-                hips, chest = json.loads(result.out)["nodes"]
-                self.assertEqual(hips["local"][12:15], [1, 90, 0])
-                self.assertEqual([round(x, 5) for x in chest["world"][12:15]], [1, 100, 0])
-                self.assertEqual(chest["parent"], "Hips")
-
-    def test_every_beginning_of_a_file_is_read_or_refused(self):
-        for end in range(0, len(BVH), 7):
-            with self.subTest(end):
-                self.write("take.bvh", BVH[:end])
-                result = self.run_program("info", "take.bvh")
-                if result.code == FAILED:
-                    self.assertIn("take.bvh", result.err)
-
     def test_a_folder_or_a_device_is_no_motion(self):
         (self.folder / "folder.bvh").mkdir()
         (self.folder / "device.bvh").symlink_to("/dev/zero")
@@ -185,14 +129,6 @@ class Files(CliTest):
         self.assertFalse((self.folder / "made.htr").exists())
         self.succeed(*command, "--force")
         self.assertTrue((self.folder / "made.htr").exists() and (self.folder / "link.htr").is_symlink())
-
-    def test_a_result_that_cannot_be_shown_is_a_failure(self):
-        self.write("take.bvh", BVH)
-        with open("/dev/full", "wb") as full:
-            for command in (["info"], ["info", "--json"], ["pose", "--frame", "0"]):
-                result = self.run_program(*command, "take.bvh", stdout=full)
-                self.assertEqual(result.code, FAILED)
-                self.assert_words(result, ["standard output"])
 
 
 class Poses(CliTest):

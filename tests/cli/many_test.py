@@ -85,16 +85,6 @@ class Batch(CliTest):
         info = json.loads(self.run_program("info", "takes/a.orn", "--json").out)
         self.assertEqual((info["package"]["rate"], info["package"]["format"]), (60, "htr"))
 
-    def test_a_batch_keeps_the_frames_that_a_save_by_hand_multiplies(self):
-        self.succeed("batch", "takes", "--job", "htr")  # at a profile rate of 30 the scales are 1 and 4
-        self.succeed("convert", "takes/a.bvh", "-o", "hand.htr")
-        for frame in (0, 7, 31):
-            batch, hand = (json.loads(self.run_program("pose", name, "--frame", number).out)["nodes"]
-                           for name, number in (("takes/a.htr", frame), ("hand.htr", 4 * frame)))
-            for ours, theirs in zip(batch, hand):
-                for x, y in zip(ours["world"], theirs["world"]):
-                    self.assertAlmostEqual(x, y, delta=0.01)
-
     def test_a_run_that_cannot_begin_says_why(self):
         self.write("empty/notes.txt", "")
         rows = [

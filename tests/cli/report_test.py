@@ -95,32 +95,6 @@ class Page(ReportTest):
         pops = cells.index("knee pops")
         self.assertEqual(cells[pops + 1:pops + 3], [str(foot["kneePops"]) for foot in figures["feet"]])
 
-    def test_several_sources_begin_with_a_table(self):
-        for name in ("a", "c"):
-            self.write("takes/%s.bvh" % name, WALK.read_bytes())
-        self.write("takes/b.bvh", BVH.replace("Frames: 3", "Frames: 30"))
-        result = self.with_assets("convert", "takes", "--out-dir", "out", "--keep-going", "--html", "out/page.html")
-        self.assertEqual(result.code, FAILED)
-        page = self.page("out/page.html")
-        summary = next(table for table in page.iter("table") if table.get("class") == "summary")
-        rows = [self.texts(row) for row in summary.iter("tr")][1:]
-        self.assertEqual([row[0] for row in rows], ["b.bvh", "a.bvh", "c.bvh"])
-        self.assertEqual(rows[0][1], "failed")
-        links = {link.get("href") for link in summary.iter("a")}
-        self.assertEqual(links, {"#" + section.get("id") for section in page.iter("section")})
-
-    def test_names_of_files_and_bones_cannot_be_markup(self):
-        joint = '<b>&"\'\x01\xff'.encode("latin-1")
-        self.write("a&<i>.bvh", BVH.encode().replace(b"Hips", joint).replace(b"Chest", b"</style>"))
-        rows = profile("<u>", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")])
-        rows = rows if isinstance(rows, bytes) else rows.encode()
-        self.write("map.prf", rows.replace(b"Hips", joint).replace(b"Chest", b"</style>"))
-        self.succeed("convert", "a&<i>.bvh", "-o", "a.htr", "--profile", "map.prf", "--html", "page.html")
-        page = self.page()
-        self.assertEqual(list(page.iter("u")), [])
-        self.assertIn('<b>&"\'\\x01\\xff', self.texts(page))
-        self.assertIn("a&<i>.bvh", self.texts(page, "h2")[0])
-
     def test_a_page_that_cannot_be_is_refused_before_the_work(self):
         self.write("page.html", OLD)
         rows = [  # what, page, code, words

@@ -50,28 +50,6 @@ TEST_F(EditorFields, EnterCommitsARateAndKeepsTheWindow)
     EXPECT_TRUE(IsEnabled(kSaveProfileButton));
 }
 
-TEST_F(EditorFields, ARateOutsideItsLimitsIsClampedAndSaid)
-{
-    Type(kFrameRateField, "10");
-    Press(Qt::Key_Tab);
-    EXPECT_THAT(m_kWindow.m_kBoxes, ElementsAre("The avaliable value is 30 to 240."));
-    EXPECT_EQ(Field(kFrameRateField), "30");
-    EXPECT_FALSE(IsEnabled(kSaveProfileButton));
-}
-
-TEST_F(EditorFields, ANewNameIsTakenAndATakenOneRefused)
-{
-    Type(kNameField, "Dancer");
-    Press(Qt::Key_Tab);
-    EXPECT_THAT(TakeBoxes(), IsEmpty());
-    EXPECT_TRUE(IsEnabled(kSaveProfileButton));
-    Type(kNameField, "mine");
-    Press(Qt::Key_Tab);
-    EXPECT_THAT(TakeBoxes(), ElementsAre("box 158"));
-    EXPECT_EQ(Field(kNameField), "Dancer");
-    EXPECT_FALSE(IsEnabled(kSaveProfileButton)) << "a refusal forgets that something was to be saved";
-}
-
 TEST_F(EditorFields, AMessageThatTakesTheFocusIsShownOnce)
 {
     m_kWindow.m_kOnBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
@@ -103,22 +81,6 @@ TEST_F(EditorFields, UndoTakesBackTypingInAFieldAndCommandsOutsideIt)
     EXPECT_EQ(Field(kNameField), "Poser") << "also from within a field that nothing was typed into";
     Press(Qt::Key_Z, Qt::ControlModifier);
     EXPECT_EQ(Field(kFrameRateField), "30");
-}
-
-TEST_F(EditorFields, AStockProfilesChangeIsSavedUnderANewName)
-{
-    const std::string stock = m_kFolder.Path("data/PoserBVH.prf");
-    std::filesystem::permissions(stock, std::filesystem::perms::owner_read);
-    const std::string untouched = ReadBytes(stock);
-    Type(kFrameRateField, "60");
-    Press(Qt::Key_Return);
-    EXPECT_EQ(Field(kNameField), "Poser(1)");
-    Click(kSaveProfileButton);
-    EXPECT_THAT(TakeBoxes(), ElementsAre("box 159"));
-    EXPECT_TRUE(Read("docs/BVH Profile/Custom1.prf").starts_with("Poser(1)\nFrameRate 60\n"));
-    EXPECT_EQ(ReadBytes(stock), untouched);
-    EXPECT_FALSE(IsEnabled(kSaveProfileButton));
-    EXPECT_EQ(SelectedProfile(), "Poser(1)");
 }
 
 TEST_F(EditorFields, ADoubleClickOpensARowsOffset)

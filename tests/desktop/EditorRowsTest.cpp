@@ -103,19 +103,6 @@ TEST_F(EditorRows, TheKeyboardSelectsRowsAsTheMouseDoes)
     EXPECT_FALSE(IsEnabled(kBoneOffsetButton));
 }
 
-TEST_F(EditorRows, RemovedRowsFreeTheirBones)
-{
-    Use("hip x LowerTorso 0\nlShin x LCalf 0\n");
-    ClickRow(1);
-    Click(kRemoveButton);
-    EXPECT_THAT(Rows(), ElementsAre(kHipRow, kPelvisRows[0], kPelvisRows[1]));
-    EXPECT_THAT(SelectedRows(), IsEmpty());
-    EXPECT_TRUE(IsEnabled(kAddToMapButton)) << "its bones are still selected, and free";
-    Click(kRemoveAllButton);
-    EXPECT_THAT(Rows(), IsEmpty());
-    EXPECT_FALSE(IsEnabled(kSaveProfileButton)) << "an emptied list needs no saving";
-}
-
 TEST_F(EditorRows, UndoAndRedoGoThroughTheCommands)
 {
     Use("hip x LowerTorso 0\nlShin x LCalf 0\n");

@@ -137,20 +137,6 @@ TEST(MainWindow, TheBarHoldsTheClockWhileItIsDragged)
     EXPECT_TRUE(WaitUntil([&] { return ScrollValue(person) == 0; })) << "and stops at the start";
 }
 
-TEST(MainWindow, TheResultAlonePlaysOnlyWithTheClockOfBoth)
-{
-    CPerson person;
-    OpenAndConvert(person);
-    const QImage still = person.Picture("#cnt2");
-    person.Click("play1");
-    EXPECT_FALSE(person.IsOn("play1"));
-    EXPECT_TRUE(person.IsOn("stop1"));
-    person.Wait(150);
-    EXPECT_EQ(person.Picture("#cnt2"), still);
-    person.Click("play");
-    EXPECT_TRUE(WaitUntil([&] { return person.Picture("#cnt2") != still; }));
-}
-
 TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
 {
     CPerson person;
@@ -168,19 +154,6 @@ TEST(MainWindow, AResultThatIsNotSavedIsAskedFor)
     person.Click("close");
     EXPECT_TRUE(WaitUntil([&] { return !person.Frame().isVisible(); }));
     EXPECT_EQ(person.m_kBoxes, QStringList(3, QStringLiteral("Save convertion result?")));
-}
-
-TEST(MainWindow, AProfileThatDoesNotFitSaysWhy)
-{
-    CPerson person;
-    OpenWalk(person);
-    person.ChooseProfile(QStringLiteral("Max BVH"));
-    person.WillAnswer("ok");
-    person.Click("convert");
-    EXPECT_FALSE(person.Content().IsConverted());
-    ASSERT_EQ(person.m_kBoxes.size(), 1);
-    EXPECT_EQ(person.m_kBoxes[0], QStringLiteral("Unable to convert motion with selected profile!"));
-    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("LeftCollar"));
 }
 
 TEST(MainWindow, NotesStayUntilTheNextStepAndInTheirOwnBoxes)
@@ -208,23 +181,6 @@ TEST(MainWindow, NotesStayUntilTheNextStepAndInTheirOwnBoxes)
     }
     OpenWalk(person);
     EXPECT_FALSE(person.Child("notes")->isVisible());
-}
-
-TEST(MainWindow, ACustomProfileIsDroppedChosenAndDeleted)
-{
-    CPerson person;
-    const std::string folder = person.Content().ProfileFile({});
-    std::string text = ReadBytes(ExecutableFolder() + "PoserBVH.prf");
-    text.replace(0, text.find('\n'), "Mine");
-    WriteBytes(folder + "Custom0.prf", text);
-    OpenWalk(person);
-    person.Drop(folder + "Custom0.prf");
-    EXPECT_EQ(person.Content().ProfilePath(), folder + "Custom0.prf");
-    EXPECT_TRUE(person.IsOn("del"));
-    person.WillAnswer("ok");
-    person.Click("del");
-    EXPECT_FALSE(FileExists(folder + "Custom0.prf"));
-    EXPECT_FALSE(person.IsOn("del"));
 }
 
 TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)

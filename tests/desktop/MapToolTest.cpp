@@ -220,31 +220,6 @@ TEST_F(MapToolTest, AMotionDroppedOnAPreviewIsLoadedThere)
     EXPECT_FALSE(drop("panel2", "walk.bvh")) << "a result is no file's";
 }
 
-TEST_F(MapToolTest, FilesThatAreNoMapOrMotionAreSaidBesideTheWindow)
-{
-    LoadSourceAndMap();
-    const QSize size = m_kTool.size();
-    Write("bad.htr", "x");
-    for (const char* button : {"1000", "1001"})
-    {
-        ClickFile(button, "bad.htr");
-        EXPECT_TRUE(Status().startsWith(QStringLiteral("bad.htr:"))) << ToUtf8(Status());
-    }
-    for (const std::string& bytes :
-         {std::string(100'000, 'x') + '\n' + std::string(100'000, '\0'),
-          std::string("\xff\xfe\x01 <---> \x80\n\n*\n"), std::string(20'000, '\n')})
-    {
-        Write("odd.txt", bytes);
-        ClickFile("1012", "odd.txt");
-        EXPECT_EQ(m_kTool.size(), size) << "no text widens the window";
-        SelectLine(0);
-        ClickAnd("1033", [](QDialog& dialog) { Press(dialog, "Cancel"); });
-        Click("1014");
-    }
-    Click("1011");
-    EXPECT_EQ(Child<QListView>("1008")->model()->rowCount(), 0);
-}
-
 TEST_F(MapToolTest, TheWindowMenuOpensTheAboutBox)
 {
     Click("menuButton");

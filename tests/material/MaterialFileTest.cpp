@@ -1,10 +1,6 @@
-#include "CAnmImage.h"
-#include "CAnmImageControl.h"
 #include "CBlendMaterial.h"
 #include "CImage.h"
 #include "CMultiMaterial.h"
-#include "CNormalBumpTex.h"
-#include "CSprite.h"
 #include "CStandardMaterial.h"
 #include "CTextureMap.h"
 #include "MaterialSamples.h"
@@ -35,67 +31,7 @@ std::vector<std::byte> BytesOfRoot(CObject* root)
     return SaveBytes(stream);
 }
 
-// Written as these bytes, and read from them.
-void ExpectBytes(const Ref<CObject>& root, const CSceneBytes& bytes)
-{
-    SCOPED_TRACE(root->GetRTTI()->m_pcName);
-    EXPECT_EQ(BytesOfRoot(root.Get()), bytes.Bytes());
-    COrrinStream again;
-    ASSERT_TRUE(LoadBytes(again, bytes.Bytes()));
-    EXPECT_EQ(SaveBytes(again), bytes.Bytes());
-}
-
 } // namespace
-
-TEST(MaterialFile, EveryClassIsWrittenAsTheFormatSays)
-{
-    CSceneBytes standard = Scene().Root();
-    AddStandardMaterial(standard, 1, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0});
-    ExpectBytes(new CStandardMaterial, standard);
-
-    const Ref<CNormalBumpTex> bump = new CNormalBumpTex;
-    bump->m_bTwoSided = true;
-    bump->m_bUseSecondMap = false;
-    bump->m_fFirstAmount = 0.25f;
-    bump->m_spkSecondMap = new CNormalBumpTex;
-    CSceneBytes bytes = Scene().Root().Object("CNormalBumpTex", 1).Byte(1).Byte(1).Byte(0);
-    bytes.Float(0.25f).Float(1).Words({0, 2});
-    bytes.Object("CNormalBumpTex", 2).Byte(0).Byte(1).Byte(1).Float(1).Float(1).Words({0, 0});
-    ExpectBytes(bump, bytes);
-
-    const Ref<CBlendMaterial> blend = new CBlendMaterial;
-    blend->m_fBlend = 0.75f;
-    blend->m_aspkMtl[1] = new CMultiMaterial;
-    blend->m_spkMask = new CMultiMaterial;
-    bytes = Scene().Root().Object("CBlendMaterial", 1).Byte(0).Float(0.75f).Words({2, 0, 3});
-    bytes.Object("CMultiMaterial", 2).Byte(0).Word(0).Object("CMultiMaterial", 3).Byte(0).Word(0);
-    ExpectBytes(blend, bytes);
-
-    const Ref<CTextureMap> map = new CTextureMap;
-    map->m_iUVWChannel = -3;
-    map->m_spkImage = new CImage;
-    bytes = Scene().Root().Object("CTextureMap", 1).Byte(0).Words({uint32_t(-3), 2});
-    bytes.Object("CImage", 2).Text("").Add<uint16_t>(0).Byte(1).Word(0);
-    ExpectBytes(map, bytes);
-
-    ExpectBytes(new CSprite, Scene().Root().Object("CSprite", 1).Words({0, 1, 0}).Byte(0).Word(0));
-
-    const Ref<CAnmImage> film = new CAnmImage;
-    film->AddFrame({
-        1, 2, -3, 4, {5, 6, 7},
-            nullptr
-    });
-    bytes = Scene().Root().Object("CAnmImage", 1).Text("");
-    bytes.Words({1, 1, 2, uint32_t(-3), 4, 0x070605, 0});
-    ExpectBytes(film, bytes);
-
-    const Ref<CAnmImageControl> control = new CAnmImageControl;
-    control->SetFilm(film.Get());
-    bytes = Scene().Root().Object("CAnmImageControl", 1).Word(0).Float(0).Float(0).Float(0).Float(1).Byte(1);
-    bytes.Words({0, 0, 2}).Object("CAnmImage", 2).Text("");
-    bytes.Words({1, 1, 2, uint32_t(-3), 4, 0x070605, 0});
-    ExpectBytes(control, bytes);
-}
 
 TEST(MaterialFile, EveryValueComesBackInEveryVersion)
 {

@@ -68,6 +68,8 @@ TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
 
 TEST_P(EveryStorage, CreateFillsClearsAndRefusesAsStated)
 {
+    CPixelBuffer other; // keeps the temporary file, so that blocks are used again
+    ASSERT_TRUE(other.SetStorage(EPixelStorage::TempStore) && other.Create(1, 1, 0));
     std::array<uint8_t, 64> block;
     block.fill(9);
     CPixelBuffer buffer;

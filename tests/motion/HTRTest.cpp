@@ -374,8 +374,10 @@ TEST(TKHTRStream, TellsSegmentsOfOneNameApart)
     const size_t first = written.find("[Head]");
     const size_t second = written.find("[Head]", first + 1);
     ASSERT_NE(second, written.npos);
-    EXPECT_NE(written.substr(first, second - first).find("\n2 "), written.npos);
-    EXPECT_NE(written.find("\n2 ", second), written.npos);
+    const std::string still = "0.000000 0.000000 0.000000 ";
+    EXPECT_NE(written.substr(first, second - first).find("\n2 " + still + "4.376245 8.184834 30.469891 "),
+              written.npos);
+    EXPECT_NE(written.find("\n2 " + still + still, second), written.npos);
 }
 
 TEST(TKHTRStream, KeepsTheSkeletonFromFileToFile)

@@ -5,6 +5,7 @@
 #include "CKeyframeControl.h"
 #include "CPoseMatcher.h"
 #include "CRetargeter.h"
+#include "CTriMesh.h"
 #include "Euler.h"
 #include "Skeleton.h"
 
@@ -205,6 +206,28 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
     }
 }
 
+// A turn about X is the last of the three that a rotation is taken apart into, of which bones take plain
+// shares, but for quaternions that are not normalised.
+TEST_F(CRetargeterTest, SharesAreInProportionToTheirWeights)
+{
+    for (CNode* node : NodesOf(*m_kSource))
+        TrackOf(*node).m_kRotationKeys.assign(10, kQuatIdentity);
+    TrackOf(*Source("Chest")).m_kRotationKeys.assign(10, QuatFromMat3(EulerToMat3("ZYX", {40, 0, 0})));
+    for (const auto& [weight, degrees] : {
+             std::pair{1.0f, 20.0f},
+             {3.0f, 30.0f},
+             {0.0f, 0.0f }
+    })
+    {
+        m_kRetargeter.SetShares(Target("Waist"), {weight, weight, 1});
+        m_kRetargeter.SetShares(Target("UpperTorso"), {1, 1, 1});
+        ASSERT_TRUE(Run(false));
+        Pose(4);
+        EXPECT_LT(DegreesBetween(Target("Waist")->m_kMatrix, EulerToMat3("ZYX", {degrees, 0, 0})), 0.3)
+            << weight;
+    }
+}
+
 TEST_F(CRetargeterTest, AnUnmappedBoneTakesItsShareOfTheTurn)
 {
     for (const char* spine : {"Waist", "UpperTorso"})
@@ -314,6 +337,19 @@ TEST_F(CRetargeterTest, TheRootStartsAtTheRootPositionAndFollowsTheScaledHip)
     EXPECT_NEAR(step.x / step.z, 0.2, 1e-3);
     EXPECT_NEAR(step.y / step.z, -0.1, 1e-3);
     EXPECT_NEAR(Vec3Length(keys[9] - keys[0]) / Vec3Length(step), 9.0, 1e-3);
+}
+
+// The left thigh stands 138 below the root, and its mesh reaches 10 below that.
+TEST_F(CRetargeterTest, WithoutAResetTheRootStandsOnTheGroundBesideTheRootPosition)
+{
+    CTriMesh* const mesh = new CTriMesh;
+    ASSERT_TRUE(mesh->SetPointCount(2));
+    mesh->XYZBuffer()[0] = {0, -10, 0};
+    mesh->XYZBuffer()[1] = {0, 50, 0};
+    Target("LThigh")->AttachChild(mesh);
+    ASSERT_TRUE(m_kRetargeter.Retarget(0, 9, 0, kFrequency, {5, 7, 11}, false, false));
+    const Vec3 first = TrackOf(*m_kTarget).m_kPositionKeys[0];
+    EXPECT_LT(Vec3Length(first - Vec3{5, 7 + 138 + 10, 11}), 0.01) << first.y;
 }
 
 TEST_F(CRetargeterTest, TracksHaveAKeyForEveryFrameThroughTheLast)

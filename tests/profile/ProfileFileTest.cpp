@@ -184,28 +184,6 @@ TEST(ProfileReader, TextThatIsNoProfileIsRefused)
     EXPECT_EQ(text, "untouched");
 }
 
-TEST(AxisCodes, TextsAndCodesAreTwoSidesOfOneTable)
-{
-    const struct
-    {
-        std::string_view text;
-        int code;
-    } rows[] = {
-        {" X", 1 },
-        {"-X", -1},
-        {" Y", 2 },
-        {"-Y", -2},
-        {" Z", 3 },
-        {"-Z", -3}
-    };
-    for (const auto& row : rows)
-    {
-        EXPECT_EQ(AxisCodeOf(row.text), row.code);
-        EXPECT_EQ(AxisText(row.code), row.text);
-    }
-    EXPECT_EQ(AxisCodeOf("-z"), -3) << "case does not count";
-}
-
 TEST(AxisCodes, OtherTextsAndCodesAreNone)
 {
     for (const std::string_view other : {"X", "", "+X", " X ", "  X"})

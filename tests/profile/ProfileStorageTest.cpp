@@ -58,6 +58,7 @@ TEST_F(ProfileEditor, CountersAndAnswerTellHowAFileFits)
         {"both found",           "A x Head 0\nB x Waist 0\n",                "2 of 2, fits"  },
         {"names without case",   "a x HEAD 0\n",                             "1 of 1, fits"  },
         {"source missing",       "A x Head 0\nNone x Waist 0\n",             "1 of 2, misfit"},
+        {"a bad row first",      "None x Waist 0\nA x Head 0\n",             "1 of 2, misfit"},
         {"target missing",       "A x None 0\n",                             "0 of 1, fits"  },
         {"both missing",         "No x None 0\n",                            "0 of 1, fits"  },
         {"fixed rows count not", "* Head . .1,2,3\n* None . .1,2,3\n",       "0 of 0, fits"  },

@@ -396,6 +396,7 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
         {"one frame early is in time",        5.0f - 0.016f, 10.0f - 0.016f},
         {"first round",                       7,             12            },
         {"second round",                      17,            12            },
+        {"the end of the last round",         25,            50            },
         {"idle from where the rounds ended",  27,            52            },
         {"a held clip stands at its begin",   47,            30            },
         {"and has an end too",                51,            51            },
