@@ -26,15 +26,15 @@ void AppendFault(CMarkup& page, const WorstFrame& worst)
 {
     switch (worst.fault)
     {
-    case EFault::Direction:
+    case EFrameFault::Direction:
         page.Raw("main bones ").Number(worst.amount, 1).Raw("° off in the mean, most of all ");
         page.Name(worst.target).Raw(", ").Number(worst.most, 1).Raw("°");
         break;
-    case EFault::KneePop:
+    case EFrameFault::KneePop:
         page.Raw("the knee above ").Name(worst.target).Raw(" jumps by ").Number(worst.amount, 1);
         page.Raw("° more than the source's");
         break;
-    case EFault::Slide:
+    case EFrameFault::Slide:
         page.Name(worst.target).Raw(" stands, and has slid ").Number(worst.amount, 1);
         page.Raw(" mm farther than the source's");
         break;
