@@ -17,7 +17,7 @@ namespace gw {
 
 namespace {
 
-enum EMessage : int
+enum EEditorMessage : int
 {
     kNameInvalid = 158,
     kSaved = 159,

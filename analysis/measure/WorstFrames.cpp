@@ -14,7 +14,7 @@ WorstFrame DirectionFault(const ConversionDetail& detail, size_t frame)
 {
     const size_t bone = detail.largestBone[frame];
     return {
-        EFault::Direction,      static_cast<int>(frame),  static_cast<double>(detail.meanError[frame]),
+        EFrameFault::Direction, static_cast<int>(frame),  static_cast<double>(detail.meanError[frame]),
         detail.mainBones[bone], detail.mainSources[bone], static_cast<double>(detail.largestError[frame])};
 }
 
@@ -49,7 +49,7 @@ void AddWorstPop(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>&
     const auto foot = std::ranges::max_element(feet, {}, &FootMeasures::kneePopLargest);
     if (foot != feet.end() && foot->kneePops > 0)
         worst.push_back(
-            {EFault::KneePop, foot->kneePopFrame, foot->kneePopLargest, foot->target, foot->source});
+            {EFrameFault::KneePop, foot->kneePopFrame, foot->kneePopLargest, foot->target, foot->source});
 }
 
 void AddWorstSlide(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>& worst)
@@ -57,7 +57,7 @@ void AddWorstSlide(const std::vector<FootMeasures>& feet, std::vector<WorstFrame
     const auto foot = std::ranges::max_element(feet, {}, &FootMeasures::addedSlideLargest);
     if (foot != feet.end() && foot->addedSlideLargest >= kNamedSlide)
         worst.push_back(
-            {EFault::Slide, foot->addedSlideFrame, foot->addedSlideLargest, foot->target, foot->source});
+            {EFrameFault::Slide, foot->addedSlideFrame, foot->addedSlideLargest, foot->target, foot->source});
 }
 
 } // namespace

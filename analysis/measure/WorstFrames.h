@@ -11,7 +11,7 @@
 namespace gw {
 
 /// What is bad in a frame.
-enum class EFault : uint8_t
+enum class EFrameFault : uint8_t
 {
     Direction, ///< the main bones point elsewhere than the source's
     KneePop,   ///< a knee's angle jumps by more than the source's does
@@ -24,7 +24,7 @@ inline constexpr double kNamedSlide = 5.0;
 /// A frame that a user should look at.
 struct WorstFrame
 {
-    EFault fault = EFault::Direction;
+    EFrameFault fault = EFrameFault::Direction;
     int frame = 0;       ///< of the source, from 0 on
     double amount = 0.0; ///< degrees: the mean over the main bones, or what a pop exceeds the source by; mm
     std::string target;  ///< the bone of the result that is farthest off, or the ankle of the leg

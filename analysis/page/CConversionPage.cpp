@@ -40,9 +40,9 @@ std::string CConversionPage::Head() const
     else
         page.Integer(static_cast<long long>(m_kRows.size())).Raw(" motions");
     page.Raw(": conversion report</title>\n<style>\n").Raw(kPageStyle).Raw("</style>\n</head>\n<body>\n");
-    page.Raw("<h1>Conversion report</h1>\n<p class=\"about\">Result against source, at every frame of the "
-             "source, counted from 0. Lengths are the result's millimetres; the source is scaled to the "
-             "result's legs.</p>\n");
+    page.Raw("<h1>Conversion report</h1>\n<p class=\"about\">The result compared with the source, at every frame "
+             "of the source, starting at 0. Lengths are millimeters of the result; the source is scaled to "
+             "the result's leg length.</p>\n");
     if (m_kRows.size() > 1 || m_uiSections == 0)
         AppendSummary(page);
     return page.Text();
@@ -54,7 +54,7 @@ void CConversionPage::AppendSummary(CMarkup& page) const
     for (const Row& row : m_kRows)
         rows.push_back(&row);
     std::ranges::stable_sort(rows, std::ranges::greater(), &Row::badness);
-    page.Raw("<div class=\"wide\"><table class=\"summary\"><thead><tr><th class=\"word\">source, the worst "
+    page.Raw("<div class=\"wide\"><table class=\"summary\"><thead><tr><th class=\"word\">source, worst "
              "first</th><th>frames</th>");
     for (const KeyFigure& figure : KeyFiguresOf({}, {}))
         page.Raw("<th>").Raw(figure.label).Raw("</th>");

@@ -25,17 +25,17 @@ void AppendFault(CMarkup& page, const WorstFrame& worst)
 {
     switch (worst.fault)
     {
-    case EFault::Direction:
-        page.Raw("main bones ").Number(worst.amount, 1).Raw("° off in the mean, most of all ");
+    case EFrameFault::Direction:
+        page.Raw("mean error of the main bones ").Number(worst.amount, 1).Raw("°, largest at ");
         page.Name(worst.target).Raw(", ").Number(worst.most, 1).Raw("°");
         break;
-    case EFault::KneePop:
+    case EFrameFault::KneePop:
         page.Raw("the knee above ").Name(worst.target).Raw(" jumps by ").Number(worst.amount, 1);
-        page.Raw("° more than the source's");
+        page.Raw("° more than in the source");
         break;
-    case EFault::Slide:
-        page.Name(worst.target).Raw(" stands, and has slid ").Number(worst.amount, 1);
-        page.Raw(" mm farther than the source's");
+    case EFrameFault::Slide:
+        page.Name(worst.target).Raw(" is planted but slides ").Number(worst.amount, 1);
+        page.Raw(" mm farther than in the source");
         break;
     }
 }
@@ -77,7 +77,7 @@ void CConversionSection::Append(CMarkup& page, const std::string& anchor)
     AppendWorstFrames(page);
     page.Raw("<h3>Over time</h3>\n<div class=\"charts\">\n");
     AppendCurves(page);
-    page.Raw("</div>\n<h3>Figures</h3>\n<div class=\"tables\">\n<div>\n");
+    page.Raw("</div>\n<h3>Measurements</h3>\n<div class=\"tables\">\n<div>\n");
     AppendPartTable(page, *m_kMotion.measured, m_kMotion.plain);
     AppendFootTable(page, *m_kMotion.measured);
     page.Raw("</div>\n");
@@ -113,7 +113,7 @@ void CConversionSection::AppendTiles(CMarkup& page) const
         page.Raw("</em>");
         if (!plain.empty())
         {
-            page.Raw("<small class=\"plain\">plain rules ");
+            page.Raw("<small class=\"plain\">default ");
             AppendFigure(page, plain[i]);
             page.Raw("</small>");
         }
@@ -154,9 +154,9 @@ void CConversionSection::AppendCurves(CMarkup& page) const
     Chart chart = NewChart("Direction error", "°");
     chart.fromZero = true;
     if (m_kMotion.plain)
-        chart.curves.push_back({"plain rules, mean", "other", m_kMotion.plain->detail.meanError});
-    chart.curves.push_back({"farthest main bone", "most", detail.largestError});
-    chart.curves.push_back({"mean of the main bones", "result", detail.meanError});
+        chart.curves.push_back({"mean, default conversion", "other", m_kMotion.plain->detail.meanError});
+    chart.curves.push_back({"worst main bone", "most", detail.largestError});
+    chart.curves.push_back({"mean of main bones", "result", detail.meanError});
     AppendChart(page, chart, m_uiMostPoints);
     AppendRootHeight(page);
     for (size_t i = 0; i < detail.feet.size(); ++i)
@@ -177,7 +177,7 @@ Chart CConversionSection::NewChart(const std::string& title, std::string_view un
 
 void CConversionSection::AppendKnee(CMarkup& page, const FootDetail& foot, const std::string& name) const
 {
-    Chart chart = NewChart("Knee above " + name, "°, 0 is straight");
+    Chart chart = NewChart("Knee above " + name, "°, 0 = straight");
     chart.fromZero = true;
     AddBothSides(chart, foot.sourceKnee, foot.resultKnee);
     AppendChart(page, chart, m_uiMostPoints);
@@ -188,8 +188,8 @@ void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const
     Chart chart = NewChart("Sole of " + name, "mm above the floor");
     chart.fromZero = true;
     AddBothSides(chart, foot.sourceSole, foot.resultSole);
-    chart.strips.push_back({"source stands", "source", foot.sourceContacts});
-    chart.strips.push_back({"result stands", "result", foot.resultContacts});
+    chart.strips.push_back({"source planted", "source", foot.sourceContacts});
+    chart.strips.push_back({"result planted", "result", foot.resultContacts});
     AppendChart(page, chart, m_uiMostPoints);
 }
 

@@ -53,9 +53,9 @@ std::optional<Vec3> FreeEnd(const CNode& node)
 }
 
 // The joints whose bones below are at fault, the one that shows it first.
-std::vector<const CNode*> BadJoints(EFault fault, const CNode* bone)
+std::vector<const CNode*> BadJoints(EFrameFault fault, const CNode* bone)
 {
-    if (!bone || fault != EFault::KneePop)
+    if (!bone || fault != EFrameFault::KneePop)
         return {bone};
     const CNode* const knee = bone->GetParentNode();
     return {knee, knee ? knee->GetParentNode() : nullptr};
@@ -72,7 +72,7 @@ CFigurePoser::CFigurePoser(const MotionClip& clip, const std::vector<std::string
         m_kSampler.Watch(node);
 }
 
-PosedFigure CFigurePoser::Pose(double frame, EFault fault, const std::string& bone)
+PosedFigure CFigurePoser::Pose(double frame, EFrameFault fault, const std::string& bone)
 {
     m_kSampler.Pose(frame);
     const std::vector<const CNode*> bad = BadJoints(fault, FindNode(m_pkTreeRoot, bone.c_str()));

@@ -32,7 +32,7 @@ public:
 
     /// The figure at a frame, which may lie between two keys. `bone` is the fault's, by the name that this
     /// side has for it.
-    PosedFigure Pose(double frame, EFault fault, const std::string& bone);
+    PosedFigure Pose(double frame, EFrameFault fault, const std::string& bone);
     /// From the figure's right hip to its left one over the ground, as posed last; +x where it has none.
     Vec3 Across(const std::string& rightThigh, const std::string& leftThigh) const;
 

@@ -21,7 +21,7 @@ void BeginTable(CMarkup& page, std::initializer_list<std::string_view> words,
     page.Raw("<div class=\"wide\"><table><thead><tr>");
     for (const std::string_view word : words)
         page.Raw("<th class=\"word\">").Raw(word).Raw("</th>");
-    page.Raw(hasPlain ? "<th>mean °</th><th>plain °</th>" : "<th>mean °</th>");
+    page.Raw(hasPlain ? "<th>mean °</th><th>default °</th>" : "<th>mean °</th>");
     for (const std::string_view number : numbers)
         page.Raw("<th>").Raw(number).Raw("</th>");
     page.Raw("</tr></thead><tbody>\n");
@@ -123,25 +123,25 @@ constexpr FootRow Row(std::string_view label, void (*append)(CMarkup&, const Foo
 
 constexpr FootRow kFootRows[] = {
     Row("contacts", Both<&Foot::resultContacts, &Foot::sourceContacts, 0>),
-    Row("frames that stand", Both<&Foot::resultStanding, &Foot::sourceStanding, 0>),
+    Row("planted frames", Both<&Foot::resultStanding, &Foot::sourceStanding, 0>),
     Row("contacts F1", F1),
     Row("added slide, mean mm", One<&Foot::addedSlideMean, 2>),
-    Row("added slide, most mm", AtFrame<&Foot::addedSlideLargest, &Foot::addedSlideFrame, 2>),
+    Row("added slide, max mm", AtFrame<&Foot::addedSlideLargest, &Foot::addedSlideFrame, 2>),
     Row("turn, mean °", One<&Foot::turnError, 2>),
-    Row("turn while standing, mean °", One<&Foot::turnWhileStanding, 2>),
+    Row("turn while planted, mean °", One<&Foot::turnWhileStanding, 2>),
     Row("turn, most °", One<&Foot::turnLargest, 2>),
     Row("sole tilt, mean °", Both<&Foot::soleTiltMean, &Foot::sourceSoleTiltMean, 2>),
-    Row("sole tilt, most °", One<&Foot::soleTiltLargest, 2>),
+    Row("sole tilt, max °", One<&Foot::soleTiltLargest, 2>),
     Row("knee pops", One<&Foot::kneePops, 0>),
-    Row("knee over the source, most °", AtFrame<&Foot::kneePopLargest, &Foot::kneePopFrame, 2>),
-    Row("knee change, most °", Both<&Foot::kneeChangeLargest, &Foot::sourceKneeChangeLargest, 2>),
+    Row("knee pop beyond the source, max °", AtFrame<&Foot::kneePopLargest, &Foot::kneePopFrame, 2>),
+    Row("knee change, max °", Both<&Foot::kneeChangeLargest, &Foot::sourceKneeChangeLargest, 2>),
 };
 
 } // namespace
 
 void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"part"}, {"most °", "at frame", "in"}, plain != nullptr);
+    BeginTable(page, {"part"}, {"max °", "at frame", "bone"}, plain != nullptr);
     for (const PartMeasures& part : measured.detail.parts)
     {
         if (part.boneCount == 0)
@@ -161,7 +161,7 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
 
 void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"bone", "source"}, {"most °", "at frame", "jitter", "of source"}, plain != nullptr);
+    BeginTable(page, {"bone", "source"}, {"max °", "at frame", "jitter", "source jitter"}, plain != nullptr);
     for (const BoneMeasures& bone : measured.sums.bones)
     {
         if (!bone.measured)

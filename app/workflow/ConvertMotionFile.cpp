@@ -75,7 +75,7 @@ bool Convert(CGaitConvertContent& content, CUnseenWindow& window, const std::str
         return false;
     if (window.MayConvert() && content.ResultMotion().GetKeyCount() > 0)
         return true;
-    window.Report(Failure(source, "no-frames", "the motion has no frames; there is nothing to convert"));
+    window.Report(Failure(source, "no-frames", "the motion has no frames, so there is nothing to convert"));
     return false;
 }
 

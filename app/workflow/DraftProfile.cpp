@@ -93,7 +93,7 @@ int CGaitConvertContent::DraftProfile()
     }
     OpenDraft(name);
     if (const std::string rows = UnsureRows(draft); !rows.empty())
-        m_kWindow.Report(Note(path, "unsure-rows", "look at these rows of the bone map: " + Printable(rows)));
+        m_kWindow.Report(Note(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows)));
     return 1;
 }
 

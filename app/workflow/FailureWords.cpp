@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// What is written: the words, the name concerned in quotes, the remedy.
+// The message consists of the words, the name concerned in quotes, and the remedy.
 template <class Reason>
 struct Words
 {
@@ -26,7 +26,7 @@ constexpr Words<Reason> Row(Reason reason, std::string_view code, std::string_vi
     return {reason, code, words, remedy};
 }
 
-constexpr std::string_view kMendLine = "mend the line, or export the file again";
+constexpr std::string_view kMendLine = "fix the line, or export the file again";
 constexpr std::string_view kCopyAgain = "the file is cut short or damaged: copy or export it again";
 constexpr std::string_view kMapHip = "map the source's hip to it";
 
@@ -39,57 +39,57 @@ constexpr Words<EFailure> kFailures[] = {
     Row(Changed, "changed", "the file was truncated while it was read", "try again when it is complete"),
     Row(Exists, "exists", "the file exists; --force replaces it"),
     Row(WriteError, "write-error", "the file cannot be written", "check free space and permissions"),
-    Row(OutOfMemory, "out-of-memory", "this takes more memory than there is"),
-    Row(UnknownFormat, "unknown-format", "no reader for this kind of file",
+    Row(OutOfMemory, "out-of-memory", "there is not enough memory"),
+    Row(UnknownFormat, "unknown-format", "this kind of file is not supported",
         "use .bvh, .htr, .cha, .chb, .orn"),
-    Row(BadHeader, "bad-header", "the file does not begin as its extension says", kCopyAgain),
+    Row(BadHeader, "bad-header", "the beginning of the file does not match its extension", kCopyAgain),
     Row(BadVersion, "bad-version", "this version of the format is not supported"),
-    Row(Empty, "empty", "there is nothing in the file that could be used"),
+    Row(Empty, "empty", "the file contains nothing usable"),
     Row(MissingSection, "missing-section", "a section or keyword is missing", kCopyAgain),
-    Row(UnexpectedLine, "unexpected-line", "another line stands where this keyword is expected", kMendLine),
-    Row(BlankLine, "blank-line", "an empty line where this keyword must stand", "take the empty line out"),
-    Row(BadNumber, "bad-number", "a number is expected here, and this is none that can be used", kMendLine),
-    Row(BadCount, "bad-count", "a count is larger than the rest of the file can hold", kCopyAgain),
-    Row(BadName, "bad-name", "a name is missing, holds a zero byte or is longer than 255 characters",
+    Row(UnexpectedLine, "unexpected-line", "expected this keyword, but found another line", kMendLine),
+    Row(BlankLine, "blank-line", "expected this keyword, but found an empty line", "remove the empty line"),
+    Row(BadNumber, "bad-number", "expected a number, but this is not a usable number", kMendLine),
+    Row(BadCount, "bad-count", "a count is larger than the rest of the file allows", kCopyAgain),
+    Row(BadName, "bad-name", "a name is missing, contains a zero byte, or is longer than 255 characters",
         "give the bone a shorter name"),
-    Row(BadBrace, "bad-brace", "a brace is missing or stands where none belongs", kMendLine),
-    Row(MissingTokens, "missing-tokens", "a line holds fewer values than it must", kMendLine),
+    Row(BadBrace, "bad-brace", "a brace is missing or misplaced", kMendLine),
+    Row(MissingTokens, "missing-tokens", "a line has too few values", kMendLine),
     Row(TooFewRows, "too-few-rows", "there are fewer rows of values than frames",
-        "set the count of frames to the rows that there are"),
-    Row(NoRoot, "no-root", "the hierarchy has no ROOT, or a JOINT stands before it"),
-    Row(UnknownSegment, "unknown-segment", "a section is for a bone that the hierarchy does not name"),
-    Row(UnknownClass, "unknown-class", "the file holds an object of a class that is not known here"),
+        "set the frame count to the number of rows"),
+    Row(NoRoot, "no-root", "the hierarchy has no ROOT, or a JOINT comes before it"),
+    Row(UnknownSegment, "unknown-segment", "a section belongs to a bone that is not in the hierarchy"),
+    Row(UnknownClass, "unknown-class", "the file contains an object of an unknown class"),
     Row(Truncated, "truncated", "the file ends in the middle of a record", kCopyAgain),
-    Row(Cycle, "cycle", "objects in the file hold each other in a ring"),
-    Row(TooDeep, "too-deep", "bones or objects are nested deeper than is supported"),
-    Row(TooLarge, "too-large", "this is larger than the limit of the format or of the program"),
-    Row(NoTrack, "no-track", "the scene holds no keyframes, so there is no motion in it"),
-    Row(ShortRow, "short-row", "a row has too few values for its joints", "export the file again"),
-    Row(StuckNumber, "stuck-number", "a number has something stuck to it; its beginning was read", kMendLine),
-    Row(DoubledOffsets, "doubled-offsets", "joint positions repeat the offsets, so bones come out doubled",
-        "export rotations only, or take the position channels out"),
-    Row(RestPose, "rest-pose", "the rest pose is no T-pose, so limbs may come out turned",
+    Row(Cycle, "cycle", "objects in the file refer to each other in a cycle"),
+    Row(TooDeep, "too-deep", "bones or objects are nested too deeply"),
+    Row(TooLarge, "too-large", "this exceeds a limit of the format or of the program"),
+    Row(NoTrack, "no-track", "the scene has no keyframes, so it contains no motion"),
+    Row(ShortRow, "short-row", "a row has fewer values than its joints need", "export the file again"),
+    Row(StuckNumber, "stuck-number", "a number is followed by extra characters; they were ignored", kMendLine),
+    Row(DoubledOffsets, "doubled-offsets", "joint positions repeat the offsets, so bones are twice as long",
+        "export rotations only, or remove the position channels"),
+    Row(RestPose, "rest-pose", "the rest pose is not a T-pose, so limbs may end up rotated",
         "set rotation offsets in the profile"),
-    Row(BadScale, "bad-scale", "the skeletons could not be compared in size; the factor 1 was taken",
+    Row(BadScale, "bad-scale", "the sizes of the skeletons could not be compared; the scale is 1",
         "map both feet and the left thigh in the profile"),
-    Row(UnknownChannel, "unknown-channel", "a channel has a name that is not known; it was passed over"),
-    Row(CutName, "cut-name", "a name cannot be used as it stands and was changed"),
+    Row(UnknownChannel, "unknown-channel", "a channel has an unknown name and was ignored"),
+    Row(CutName, "cut-name", "a name could not be used as it is and was changed"),
     Row(OpenHeader, "open-header", "no empty line closes the header, so the motion has no frames",
-        "put an empty line behind the header"),
+        "add an empty line after the header"),
     Row(SkippedPicture, "skipped-picture",
-        "a linked picture was not read: the pictures are too large together", "link smaller pictures"),
+        "a linked picture was not read: together, the pictures are too large", "link smaller pictures"),
 };
 
 constexpr Words<EMisfit> kMisfits[] = {
     Row(EMisfit::NoScene, "no-scene", "there is no source or no target skeleton",
-        "see that base.htr lies beside the program"),
+        "make sure that base.htr is next to the program"),
     Row(EMisfit::NoProfile, "no-profile", "no profile is selected",
-        "choose one that fits the source's bones"),
+        "choose one that matches the source's bones"),
     Row(EMisfit::NoRootRow, "no-root-row", "no row of the profile drives the target's root bone", kMapHip),
     Row(EMisfit::NoRootSource, "no-root-source", "the profile keeps the target's root bone fixed", kMapHip),
-    Row(EMisfit::NoBody, "no-body", "the profile tells too little of a body to align the motion by",
-        "map hip, both thighs and neck or head"),
-    Row(EMisfit::TurnedAtRest, "turned-at-rest", "limbs may come out turned, as their bones stand at rest",
+    Row(EMisfit::NoBody, "no-body", "the profile maps too few joints to align the motion",
+        "map the hip, both thighs, and the neck or head"),
+    Row(EMisfit::TurnedAtRest, "turned-at-rest", "limbs may end up rotated, because the rest poses differ",
         "align the motion, or set rotation offsets in the profile"),
 };
 

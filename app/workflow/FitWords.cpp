@@ -19,7 +19,7 @@ std::string MissingLine(const CMissingBone& missing)
 {
     const std::string place = missing.line == 0 ? "" : "line " + std::to_string(missing.line) + ": ";
     const std::string nearest =
-        missing.nearest.empty() ? "; no name is near" : "; the nearest is " + Quoted(missing.nearest);
+        missing.nearest.empty() ? "; no similar name found" : "; the closest is " + Quoted(missing.nearest);
     return "  " + place + "the " + SideName(missing.side) + " has no bone " + Quoted(missing.name) + nearest;
 }
 
@@ -33,8 +33,8 @@ const char* SideName(ESkeletonSide side)
 std::string FitSummary(const CProfileFit& fit)
 {
     if (fit.foundCount != fit.rowCount)
-        return std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + " rows fit";
-    return std::to_string(fit.rowCount) + " rows, all fit";
+        return std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + " rows match";
+    return std::to_string(fit.rowCount) + " rows, all match";
 }
 
 std::string MissingLines(const CProfileFit& fit)

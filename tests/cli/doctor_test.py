@@ -74,7 +74,7 @@ class Doctor(CliTest):
         self.write("ill.bvh", SHORT.replace("JOINT Chest", "JOINT My Chest"))
         result = self.run_program("doctor", "ill.bvh", "--fix", "better.bvh")
         self.assertEqual(result.code, FAILED)
-        self.assertIn("ill.bvh -> better.bvh: mended, but this is left\nbetter.bvh:20: short-row", result.out)
+        self.assertIn("ill.bvh -> better.bvh: mended, but these faults are left\nbetter.bvh:20: short-row", result.out)
 
     def test_where_nothing_can_be_mended_no_copy_is_written(self):
         self.write("ill.bvh", SHORT)

@@ -7,7 +7,7 @@ COMMANDS = ("convert", "batch", "plan", "run", "merge-report", "info", "pose", "
             "package", "profiles", "compare", "render", "dump", "suggest")
 
 WRONG = [  # what, arguments, words on standard error
-    ("no command", "", ["a command is missing", "--help"]),
+    ("no command", "", ["missing command", "--help"]),
     ("a slip in a command", "convret a.bvh", ["convret", "'convert'"]),
     ("a word that is near nothing", "frobnicate", ["no command", "--help"]),
     ("an option before the command", "--json info a.bvh", ["--json"]),
@@ -21,16 +21,16 @@ WRONG = [  # what, arguments, words on standard error
     ("a required option is missing", "extract a.Kinetra", ["-o"]),
     ("none of two options of which one must be there", "pose a.bvh", ["--frame N | --time T"]),
     ("both of them", "pose a.bvh --frame 1 --time 2", ["one of", "--frame N | --time T"]),
-    ("a time that is no number", "pose a.bvh --time now", ['"now"', "no number"]),
+    ("a time that is not a number", "pose a.bvh --time now", ['"now"', "not a number"]),
     ("a time without end", "pose a.bvh --time inf", ["inf"]),
     ("a folder is missing", "dump a.orn", ["--out-dir"]),
     ("an option without its value", "pose a.bvh --frame", ["--frame"]),
     ("an option twice", "pose a.bvh --frame 1 --frame 2", ["--frame"]),
-    ("a frame that is no integer", "pose a.bvh --frame 1.5", ["1.5"]),
+    ("a frame that is not an integer", "pose a.bvh --frame 1.5", ["1.5"]),
     ("a frame that no integer holds", "pose a.bvh --frame 99999999999999999999", ["--frame"]),
     ("a rate of nothing", "package a.htr b.Kinetra --rate 0", ['"0"', "above 0"]),
     ("a rate below nothing", "package a.htr b.Kinetra --rate=-30", ["above 0"]),
-    ("a rate that is no number", "package a.htr b.Kinetra --rate nan", ["nan"]),
+    ("a rate that is not a number", "package a.htr b.Kinetra --rate nan", ["nan"]),
     ("a rate without end", "package a.htr b.Kinetra --rate inf", ["inf"]),
     ("a rate with something stuck to it", "package a.htr b.Kinetra --rate 30fps", ["30fps"]),
     ("a job that there is not", "batch . --job fbx", ["fbx", "htr|orn"]),

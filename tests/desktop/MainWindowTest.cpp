@@ -175,7 +175,7 @@ TEST(MainWindow, NotesStayUntilTheNextStepAndInTheirOwnBoxes)
     {
         person.WillAnswer("ok");
         person.Click("notes");
-        EXPECT_EQ(person.m_kBoxes.back(), QStringLiteral("Notes on the last step"));
+        EXPECT_EQ(person.m_kBoxes.back(), QStringLiteral("Warnings from the last step"));
         EXPECT_EQ(person.m_kDetails, notes);
         EXPECT_TRUE(person.m_bUnfolded);
     }

@@ -1,4 +1,4 @@
-// Whatever bytes a file has: an answer, and never a healthy one where the reader does not take it.
+// Whatever bytes a file has: an answer, and never a healthy one where the file cannot be read.
 
 #include "CMotionFile.h"
 #include "Examined.h"

@@ -127,13 +127,13 @@ TEST(WorstFrames, AreThoseOfTheFaultsThatWereMade)
     const std::vector<WorstFrame> worst = FindWorstFrames(measured.sums, measured.detail, 3);
     const struct
     {
-        EFault fault;
+        EFrameFault fault;
         int frame;
         double amount;
     } rows[] = {
-        {EFault::Direction, 20, 60.0 / static_cast<double>(measured.detail.mainBones.size())},
-        {EFault::KneePop,   40, 14.0                                                        },
-        {EFault::Slide,     77, 150.0                                                       },
+        {EFrameFault::Direction, 20, 60.0 / static_cast<double>(measured.detail.mainBones.size())},
+        {EFrameFault::KneePop,   40, 14.0                                                        },
+        {EFrameFault::Slide,     77, 150.0                                                       },
     };
     ASSERT_EQ(worst.size(), std::size(rows));
     for (size_t i = 0; i < worst.size(); ++i)

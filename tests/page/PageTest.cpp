@@ -238,7 +238,7 @@ TEST(Page, SetsTheChoicesAgainstThePlainRules)
     EXPECT_FALSE(Has(chosen.Page(), "plain rules"));
     chosen.Motion().plain = &plain.Measured();
     const std::string page = chosen.Page();
-    EXPECT_TRUE(Has(page, "<th>plain °</th>"));
+    EXPECT_TRUE(Has(page, "<th>default °</th>"));
     EXPECT_TRUE(Has(page, "<td>33.000</td>"));
 }
 

@@ -28,11 +28,11 @@ struct NeedWords
 };
 
 constexpr NeedWords kNeeds[] = {
-    {EAlignNeed::RestPose,         "rest-pose",      "bone beside its axis at rest",   "bones beside their axes at rest"},
+    {EAlignNeed::RestPose,         "rest-pose",      "bone off its axis at rest",      "bones off their axes at rest"},
     {EAlignNeed::UpAxis,           "up-axis",        "up axis that is not Y",          "up axes that are not Y"         },
-    {EAlignNeed::BoneFrames,       "bone-frame",     "bone frame turned by its slant",
-     "bone frames turned by their slant"                                                                                },
-    {EAlignNeed::DoubledPositions, "doubled-offset", "bone told twice",                "bones told twice"               },
+    {EAlignNeed::BoneFrames,       "bone-frame",     "rotated frame of a slanted bone",
+     "rotated frames of slanted bones"                                                                                  },
+    {EAlignNeed::DoubledPositions, "doubled-offset", "doubled bone",                   "doubled bones"                  },
 };
 
 const char* CodeOf(EAlignNeed need)
@@ -40,7 +40,7 @@ const char* CodeOf(EAlignNeed need)
     return std::ranges::find(kNeeds, need, &NeedWords::need)->code;
 }
 
-// "4 bones beside their axes at rest, 2 bone frames turned by their slant"
+// "4 bones off their axes at rest, 2 rotated frames of slanted bones"
 std::string MendedText(const AlignReport& report)
 {
     std::string text;
@@ -52,7 +52,7 @@ std::string MendedText(const AlignReport& report)
         text +=
             (text.empty() ? "" : ", ") + std::to_string(count) + ' ' + (count == 1 ? words.one : words.many);
     }
-    return text.empty() ? "nothing to mend" : text;
+    return text.empty() ? "nothing to align" : text;
 }
 
 bool SelectProfile(const COptions& options, CShellContent& content)
@@ -97,7 +97,7 @@ EExit RunAlign(const COptions& options)
 {
     if (!HasExtension(options.output, ".bvh"))
     {
-        SayError(Printable(options.output) + ": an aligned motion is a .bvh file");
+        SayError(Printable(options.output) + ": the output must be a .bvh file");
         return EExit::Usage;
     }
     if (!MayWrite(options, options.output))

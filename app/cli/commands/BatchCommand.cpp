@@ -107,7 +107,7 @@ EExit Refuse(const std::string& words)
 EExit RunBatchFolder(const COptions& options)
 {
     if (!options.files.empty() && !FolderExists(options.files[0]))
-        return Refuse(Printable(options.files[0]) + ": there is no such folder");
+        return Refuse(Printable(options.files[0]) + ": no such folder");
     if (!IsRunPossible(options))
         return EExit::Usage;
     if (!options.files.empty() && !CanListFolder(options, options.files[0]))
@@ -119,7 +119,7 @@ EExit RunBatchFolder(const COptions& options)
         return EExit::Usage;
     if (jobs.empty())
         return Refuse(Printable(options.files.empty() ? options.filesFrom : options.files[0]) +
-                      ": the folder holds no " + std::string(BatchSource(BatchJobOf(options))) + " file");
+                      ": the folder contains no " + std::string(BatchSource(BatchJobOf(options))) + " file");
     if (!MakeOutputFolder(options))
         return EExit::Failed;
     return RunBatchJobs(options, jobs);

@@ -144,7 +144,7 @@ EExit RunCompare(const COptions& options)
     measured.sums = MeasureConversion(sourceClip, resultClip, pairs, detail);
     if (measured.sums.frameCount == 0)
     {
-        SayError("there is nothing to compare: a motion has no frames");
+        SayError("nothing to compare: one of the motions has no frames");
         return EExit::Failed;
     }
     if (options.json)

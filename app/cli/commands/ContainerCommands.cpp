@@ -52,14 +52,14 @@ EExit RunExtract(const COptions& options)
     const CPackageBlocks blocks = FindPackage(scene);
     if (!blocks.file)
     {
-        SayError(Printable(source) + ": this is no Kinetra file: the data blocks \"MotionInfo\" and "
-                                     "\"MotionFile\" are expected among the roots");
+        SayError(Printable(source) + ": this is not a Kinetra file: its roots must include the data blocks "
+                                     "\"MotionInfo\" and \"MotionFile\"");
         return EExit::Failed;
     }
     CPackageFacts facts;
     const std::string inside = ReadPackageFacts(*blocks.info, facts) ? FormatExtension(facts.format) : "";
     if (!inside.empty() && !HasExtension(options.output, inside))
-        SayWord(options, "warning: " + Printable(source) + " holds an " + inside + " file");
+        SayWord(options, "warning: " + Printable(source) + " contains an " + inside + " file");
     if (!WriteWhole(options.output, blocks.file->Data()))
         return Fail(options.output, EFailure::WriteError);
     return TellWritten(options, source, options.output);

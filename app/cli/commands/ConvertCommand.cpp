@@ -32,7 +32,7 @@ bool ResolveOutput(std::string& output)
     else if (EqualNoCase(parts.extension, ".htr"))
         output = parts.folder + parts.stem + ".htr";
     else if (!EqualNoCase(parts.extension, ".Kinetra"))
-        return Refuse(Printable(output) + ": a result is a .Kinetra or an .htr file");
+        return Refuse(Printable(output) + ": the output must be a .Kinetra or .htr file");
     return true;
 }
 
@@ -88,7 +88,7 @@ bool IsManyPossible(const COptions& options)
     if (options.outputFolder.empty())
         return Refuse("several sources, or a folder, need --out-dir DIR");
     if (!options.output.empty())
-        return Refuse("-o names a single file; with --out-dir every result takes the name of its source");
+        return Refuse("-o names a single file and cannot be combined with --out-dir, which names results after their sources");
     return true;
 }
 

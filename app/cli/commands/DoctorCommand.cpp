@@ -52,7 +52,7 @@ void Print(const COptions& options, const std::string& path, const CFileExam& ex
     if (options.quiet)
         return;
     if (!exam.Facts() && !exam.Findings().HasFaults())
-        PrintLine(Printable(path) + ": whole; a container has no poses to examine");
+        PrintLine(Printable(path) + ": intact; a container has no poses to check");
     if (!exam.Facts())
         return;
     const bool mixed = exam.Findings().Has(EFault::MixedChannels);
@@ -139,12 +139,12 @@ bool Refuse(const std::string& words)
 bool CanFix(const COptions& options)
 {
     if (options.files.size() != 1)
-        return Refuse("--fix takes one file");
+        return Refuse("--fix needs exactly one file");
     const std::string& source = options.files[0];
     if (!HasExtension(source, ".bvh") || !HasExtension(options.fix, ".bvh"))
-        return Refuse("--fix mends a .bvh into another .bvh");
+        return Refuse("--fix writes a repaired .bvh from a .bvh");
     if (IsSameFile(source, options.fix))
-        return Refuse(Printable(source) + ": a file is never mended in place; name another one behind --fix");
+        return Refuse(Printable(source) + ": a file is never repaired in place; pass another name to --fix");
     return true;
 }
 
@@ -166,9 +166,9 @@ void TellFixed(const COptions& options, const CFileExam& exam, const CFileExam& 
     const std::string& source = options.files[0];
     Print(options, source, exam);
     std::string line = Printable(source) + " -> " + Printable(options.fix) + ": ";
-    line += exam.Findings().HasFaults() ? "mended" : "nothing to mend";
+    line += exam.Findings().HasFaults() ? "repaired" : "nothing to repair";
     if (copy.Findings().HasFaults())
-        line += ", but this is left";
+        line += ", but these faults are left";
     PrintLine(line);
     PrintFaults(options.fix, copy.Findings());
 }
@@ -182,7 +182,7 @@ EExit FixFile(const COptions& options)
     if (exam.Findings().HasFaults() && !exam.Findings().MendsAny())
     {
         Tell(options, source, exam);
-        SayError(Printable(source) + ": nothing of this can be mended; no copy was written");
+        SayError(Printable(source) + ": none of these faults can be repaired, so no copy was written");
         return EExit::Failed;
     }
     if (!exam.WriteMended(options.fix))

@@ -40,10 +40,10 @@ EExit RunDump(const COptions& options)
     SayWarnings(options, source, file.Record());
     const std::vector<CObject*> roots = file.Roots();
     if (roots.empty())
-        SayWord(options, "warning: " + Printable(source) + ": there is no root to show");
+        SayWord(options, "warning: " + Printable(source) + ": there are no roots to show");
     const std::string folder = WithSeparator(options.outputFolder);
     if (!CreateFolder(options.outputFolder))
-        return Fail(folder, "the folder cannot be made");
+        return Fail(folder, "the folder cannot be created");
     if (!WriteTreeView(folder))
         return Fail(folder + "TreeView.js", "the file cannot be written");
 

@@ -53,7 +53,7 @@ bool ReadReport(const std::string& path, Lines& lines)
         ++number;
         if (!TakeLine(line, lines))
             SayError(Printable(path) + ':' + std::to_string(number) +
-                     ": this line is nested deeper than a report can be, and was skipped");
+                     ": this line is nested too deeply for a report and was skipped");
     }
     return true;
 }

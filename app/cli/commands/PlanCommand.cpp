@@ -43,7 +43,7 @@ bool MakePlan(const COptions& options, const CFileRun::Jobs& jobs, CRunPlan& pla
         if (!IsUtf8(entry.source) || !IsUtf8(entry.output))
         {
             SayError(Printable(job.source) +
-                     ": the name is no UTF-8, and a plan keeps no other; rename the file");
+                     ": the name is not valid UTF-8, which a plan needs; rename the file");
             return false;
         }
         plan.entries.push_back(std::move(entry));
@@ -78,7 +78,7 @@ bool AreSourcesThere(const COptions& options)
     {
         if (IsTaken(path))
             continue;
-        SayError(Printable(path) + ": there is no such file or folder");
+        SayError(Printable(path) + ": no such file or folder");
         return false;
     }
     return true;
@@ -88,7 +88,7 @@ bool AreShardsRight(const COptions& options)
 {
     const bool right = *options.shards >= 1 && *options.shards <= kShardLimit;
     if (!right)
-        SayError("--shards takes a number from 1 to 1000000");
+        SayError("--shards must be a number from 1 to 1000000");
     return right;
 }
 

@@ -27,7 +27,7 @@ EExit RunArguments(int argc, char** argv)
         return arguments.command ? arguments.command->run(arguments.options) : arguments.exit;
     } catch (const std::bad_alloc&)
     {
-        SayError("there is not enough memory for this");
+        SayError("there is not enough memory");
         return EExit::Failed;
     }
 }

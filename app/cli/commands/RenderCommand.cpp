@@ -91,13 +91,13 @@ std::string SizeText(const PictureOptions& picture)
 bool CanDraw(const COptions& options, const PictureOptions& picture)
 {
     if (!HasExtension(options.output, ".png"))
-        return Refuse(Printable(options.output) + ": a picture is a .png file");
+        return Refuse(Printable(options.output) + ": the picture must be a .png file");
     if (picture.poseCount < 1)
-        return Refuse("--strip " + std::to_string(options.strip) + ": a picture shows one pose or more");
+        return Refuse("--strip " + std::to_string(options.strip) + ": a picture needs at least one pose");
     const std::string poses = picture.poseCount == 1 ? "a pose" : std::to_string(options.strip) + " poses";
     return IsDrawable(picture) ||
-           Refuse("there is no room for " + poses + " in " + SizeText(picture) + " pixels: a side has 1 to " +
-                  std::to_string(kLongestSide) + ", and every pose needs one of them");
+           Refuse("cannot draw " + poses + " in " + SizeText(picture) + " pixels: each side must be 1 to " +
+                  std::to_string(kLongestSide) + ", and each pose needs at least one pixel");
 }
 
 // Null for a picture that was not drawn.
@@ -124,7 +124,7 @@ std::string PictureWords(const PictureOptions& picture)
     const std::string frame = std::to_string(picture.frame);
     const std::string poses = picture.poseCount == 1
                                   ? "frame " + frame
-                                  : std::to_string(picture.poseCount) + " poses from frame " + frame + " on";
+                                  : std::to_string(picture.poseCount) + " poses starting at frame " + frame;
     return SizeText(picture) + " pixels, " + poses;
 }
 
@@ -145,9 +145,9 @@ bool Draw(const PictureOptions& options, const std::string& output)
     const EPictureAnswer answer = RenderPicture(options, picture);
     if (answer == EPictureAnswer::NoPainter)
         return Refuse(
-            "pictures need gw_picture_painter.so beside the program, and the libraries that it loads");
+            "drawing needs gw_picture_painter.so next to the program, and the libraries that it loads");
     if (answer != EPictureAnswer::Done)
-        return Refuse("the GL of this machine draws no such picture without a display; that of Mesa does");
+        return Refuse("the OpenGL driver cannot draw this picture without a display; Mesa's driver can");
     if (WritePng(output, picture))
         return true;
     SayFailure(output, {EFailure::WriteError, 0, {}});

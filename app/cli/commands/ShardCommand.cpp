@@ -19,12 +19,12 @@ bool TakePlan(const CRunPlan& plan, size_t shard, COptions& options)
     const std::string planPath = options.files[0];
     if (!ReadOptionsJson(plan.options, ~kHowToRun, options, wrong))
     {
-        SayError(Printable(planPath) + ":1: the plan has an option that there is not: " + Quoted(wrong));
+        SayError(Printable(planPath) + ":1: the plan has an unknown option: " + Quoted(wrong));
         return false;
     }
     if (IsSameFile(options.report, planPath))
     {
-        SayError(Printable(options.report) + ": this is the plan; name another file for the report");
+        SayError(Printable(options.report) + ": this is the plan; choose another file for the report");
         return false;
     }
     options.files.clear();
@@ -46,7 +46,7 @@ bool HasShard(const CRunPlan& plan, int64_t shard)
 {
     if (static_cast<uint64_t>(shard) < plan.shardCount)
         return true;
-    SayError("there is no shard " + std::to_string(shard) + "; those of the plan are 0 to " +
+    SayError("there is no shard " + std::to_string(shard) + "; the plan has shards 0 to " +
              std::to_string(plan.shardCount - 1));
     return false;
 }

@@ -25,21 +25,21 @@ constexpr const char* kJointWords[] = {"hip",     "spine joint", "neck",  "head"
 constexpr const char* kSurenessWords[] = {"sure", "likely", "unsure"};
 
 constexpr const char* kEvidenceWords[] = {
-    "nothing tells",
-    "by its shape; its name says nothing",
-    "by its shape, against its name",
-    "by its name; its shape does not tell",
+    "no evidence",
+    "by shape; the name gives no hint",
+    "by shape, although the name disagrees",
+    "by name; the shape gives no hint",
     "by name and shape",
 };
 constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
 
 constexpr const char* kDoubtWords[] = {
-    "it does not hang from the joint that should carry it",
+    "it is not below the expected parent joint",
     "left and right may be swapped",
     "the joint before may be the upper arm",
     "it may be the clavicle",
-    "the legs go up with the body",
-    "its bones are not in proportion",
+    "the legs point up like the trunk",
+    "its bones are out of proportion",
 };
 constexpr const char* kDoubtCodes[] = {"not-below",       "sides-swapped", "clavicle-is-arm",
                                        "arm-is-clavicle", "legs-up",       "odd-length"};
@@ -66,11 +66,11 @@ std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
     switch (row.kind)
     {
     case ESuggestedRow::Fixed:
-        return "no source, as in every profile";
+        return "fixed, as in every profile";
     case ESuggestedRow::NoSource:
-        return "left out: the skeleton has no " + PlaceWords(row.place) + " for it";
+        return "left out: the skeleton has no " + PlaceWords(row.place);
     case ESuggestedRow::NoName:
-        return "left out: a profile cannot tell this joint by its name";
+        return "left out: the name of this joint cannot be used in a profile";
     default:
         break;
     }
@@ -79,7 +79,7 @@ std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
     for (const EBodyDoubt doubt : row.doubts)
         reason += std::string("; ") + Text(kDoubtWords, doubt);
     if (row.nudged)
-        reason += "; turned a little about itself, so that the bone below can be followed";
+        reason += "; rotated slightly around its own axis, so that the bone below can follow";
     if (!profile.sidesAreSure && HasSides(row.place.joint))
         reason += "; no pose shows which side is left";
     return reason;
@@ -155,7 +155,7 @@ void WriteJson(const COptions& options, const std::string& name, const Suggested
 // Says which of the thirteen joints were not found.
 EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
 {
-    std::string words = Printable(source) + ": no whole body was found by names or by shape; missing: ";
+    std::string words = Printable(source) + ": no complete body was found by names or shape; missing: ";
     for (const BodyPlace& place : profile.missing)
         words += (&place == profile.missing.data() ? "" : ", ") + PlaceWords(place);
     SayError(words);
@@ -164,7 +164,7 @@ EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
         if (row.kind == ESuggestedRow::NoName)
             SayError(Printable(source) + ": the " + PlaceWords(row.place) + " would be " +
                      Quoted(row.source->NameView()) +
-                     ", but a profile cannot tell that joint by its name; rename it in the file");
+                     ", but the name of that joint cannot be used in a profile; rename it in the file");
     }
     return EExit::Failed;
 }
@@ -193,7 +193,7 @@ void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
         return;
     CReport report = ShellFailure(options.output, "rate",
                                   "the source has " + std::to_string(sourceRate) +
-                                      " frames per second, and the nearest rate that a profile may have is " +
+                                      " frames per second, but the nearest rate that a profile can have is " +
                                       std::to_string(profileRate) + ", so results will play " +
                                       (sourceRate < profileRate ? "faster" : "slower"));
     report.warning = true;
@@ -211,8 +211,8 @@ EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* s
     if (!profile.turnsFromRest)
         SayWord(options,
                 std::string("the rest pose ") +
-                    (profile.restIsStance ? "has its legs spread" : "is none that a body stands in") +
-                    "; how bones are turned about themselves was taken from a frame of the motion");
+                    (profile.restIsStance ? "has its legs spread" : "is not a standing pose") +
+                    "; the rotation of bones around their own axes was measured in a frame of the motion");
     if (options.json)
     {
         WriteJson(options, name, profile);
@@ -228,7 +228,7 @@ EExit RunSuggest(const COptions& options)
 {
     if (!HasExtension(options.output, ".prf"))
     {
-        SayError(Printable(options.output) + ": a profile's file ends in .prf");
+        SayError(Printable(options.output) + ": the name of a profile must end in .prf");
         return EExit::Usage;
     }
     if (!MayWrite(options, options.output))

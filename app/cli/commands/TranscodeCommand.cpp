@@ -27,13 +27,13 @@ bool CanTranscode(const COptions& options)
     {
         if (options.frameScale == 1.0f)
             return true;
-        SayError("--frame-scale is for .htr files; a .bvh is written frame by frame");
+        SayError("--frame-scale works only for .htr output; a .bvh is written frame by frame");
         return false;
     }
     if (HasExtension(output, ".htr") && HasExtension(source, ".htr"))
         return true;
-    SayError(Printable(output) + ": an .htr can be written as .htr or .bvh, any other motion as .bvh; "
-                                 "'gaitwright convert' makes an .htr of it");
+    SayError(Printable(output) + ": an .htr can be written as .htr or .bvh, any other motion only as .bvh; "
+                                 "use 'gaitwright convert' to make an .htr");
     return false;
 }
 
@@ -42,10 +42,9 @@ const char* WhyNoBVH(const CMotionFile& motion)
 {
     constexpr float kLeastFrameTime = 0.0000005f;
     if (motion.GetLastFrame() <= -1.0f)
-        return "the motion has no frames; there is nothing to write";
+        return "the motion has no frames, so there is nothing to write";
     if (!(motion.GetFrequency() >= kLeastFrameTime) || !std::isfinite(motion.GetFrequency()))
-        return "the frame time is 0 or too small for a .bvh, which keeps six digits; no rate could be read "
-               "from it";
+        return "the frame time is 0, or too small for the six digits of a .bvh, so the rate would be lost";
     return nullptr;
 }
 

@@ -57,14 +57,14 @@ public:
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
             if (!ScanInteger(text, *number))
-                throw CLI::ValidationError(Quoted(text) + " is no integer");
+                throw CLI::ValidationError(Quoted(text) + " is not an integer");
         });
     }
     CLI::Option* operator()(std::optional<int64_t> COptions::*target) const
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
             if (!ScanInteger(text, number->emplace()) || **number < 0)
-                throw CLI::ValidationError(Quoted(text) + " is no whole number");
+                throw CLI::ValidationError(Quoted(text) + " is not a non-negative integer");
         });
     }
     CLI::Option* operator()(CPixelSize COptions::*target) const
@@ -74,21 +74,21 @@ public:
             const size_t cross = std::min(text.find('x'), text.size());
             if (!ScanInteger(words.substr(0, cross), size->width) ||
                 !ScanInteger(words.substr(std::min(cross + 1, text.size())), size->height))
-                throw CLI::ValidationError(Quoted(text) + " is no size like 640x480");
+                throw CLI::ValidationError(Quoted(text) + " is not a size such as 640x480");
         });
     }
     CLI::Option* operator()(float COptions::*target) const
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
             if (!ScanNumber(text, *number) || !(*number > 0.0f))
-                throw CLI::ValidationError(Quoted(text) + " is no number above 0");
+                throw CLI::ValidationError(Quoted(text) + " is not a positive number");
         });
     }
     CLI::Option* operator()(std::optional<float> COptions::*target) const
     {
         return Add([number = &(m_kOptions.*target)](const std::string& text) {
             if (!ScanNumber(text, number->emplace()))
-                throw CLI::ValidationError(Quoted(text) + " is no number");
+                throw CLI::ValidationError(Quoted(text) + " is not a number");
         });
     }
 
@@ -114,7 +114,7 @@ CLI::Validator OneOf(std::string_view choices)
             if (word == text)
                 return std::string();
         }
-        return Quoted(text) + " is none of " + std::string(choices);
+        return Quoted(text) + " is not one of " + std::string(choices);
     };
     return CLI::Validator(check, std::string(choices));
 }
@@ -218,7 +218,7 @@ std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, CO
     if (options.files.size() < LeastOperands(command) && options.filesFrom.empty())
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
     if (options.files.size() > MostOperands(command))
-        return RefuseFor(command, "one argument too many: " + Quoted(options.files[MostOperands(command)]));
+        return RefuseFor(command, "unexpected argument: " + Quoted(options.files[MostOperands(command)]));
     return std::nullopt;
 }
 
@@ -253,8 +253,8 @@ EExit ParseWithoutCommand(std::string_view word, std::string_view next)
     }
     const std::string remedy = "'gaitwright --help' lists the commands";
     if (word.empty())
-        return Refuse("a command is missing", {}, remedy);
-    return Refuse("there is no command " + Quoted(word), NearestName(word, CommandNames()), remedy);
+        return Refuse("missing command", {}, remedy);
+    return Refuse("unknown command " + Quoted(word), NearestName(word, CommandNames()), remedy);
 }
 
 } // namespace

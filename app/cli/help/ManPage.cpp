@@ -19,13 +19,13 @@ constexpr std::string_view kHead =
     "[OPTIONS] FILES\n"
     ".SH DESCRIPTION\n"
     "Converts motions to the target skeleton of the host program.\n"
-    "Results stand on standard output, all other words on standard error.\n"
-    "A file that exists is only replaced where a command says so or is told to.\n";
+    "Results go to standard output, messages to standard error.\n"
+    "Existing files are kept unless you pass --force or the command says that it replaces them.\n";
 
 constexpr std::string_view kTail = ".SH FILES\n"
                                    ".TP\n"
                                    ".I BVH Profile\n"
-                                   "In the documents folder: bone maps of your own.\n"
+                                   "Your own bone maps, in the documents folder.\n"
                                    ".SH SEE ALSO\n"
                                    ".BR GaitForge (1)\n";
 
@@ -54,7 +54,7 @@ std::string Bold(std::string_view text)
     return "\\fB" + Escaped(text) + "\\fR";
 }
 
-// What stands behind an option, or the operands of a command.
+// The value of an option, or the operands of a command.
 std::string Slanted(std::string_view text)
 {
     return text.empty() ? std::string() : " \\fI" + Escaped(text) + "\\fR";
@@ -77,7 +77,7 @@ std::string OptionEntries(uint64_t bits)
     return text;
 }
 
-// The options that every command takes stand in the page once.
+// Options that every command accepts; the page lists them once.
 uint64_t SharedOptions()
 {
     uint64_t shared = ~uint64_t{0};
@@ -86,7 +86,7 @@ uint64_t SharedOptions()
     return shared;
 }
 
-// The first line of a help is a sentence of its own, and the rest a text that was broken by hand.
+// The first line of a help text is a separate sentence; the rest was wrapped by hand.
 std::string CommandEntry(const CCommand& command)
 {
     const std::string_view help = command.help;
@@ -103,9 +103,9 @@ std::string CommandEntry(const CCommand& command)
 std::string ManPage()
 {
     std::string page(kHead);
-    page += ".SH OPTIONS\nOf every command:\n" + OptionEntries(SharedOptions()) +
-            OptionEntry("-h,--help", {}, "the help of a command") +
-            OptionEntry("--version", {}, "of the program, in the place of a command") + ".SH COMMANDS\n";
+    page += ".SH OPTIONS\nFor every command:\n" + OptionEntries(SharedOptions()) +
+            OptionEntry("-h,--help", {}, "show the help of a command") +
+            OptionEntry("--version", {}, "show the version; used without a command") + ".SH COMMANDS\n";
     for (const CCommand& command : Commands())
         page += CommandEntry(command);
     return page + ".SH EXIT STATUS\n" + std::string(kExitCodes) + '\n' + std::string(kTail);

@@ -15,50 +15,50 @@ constexpr COptionRow Row(EOption bit, std::string_view names, std::string_view v
 constexpr COptionRow kOptions[] = {
     Row(kOutput, "-o,--output", "OUT", &COptions::output, "the file to write"),
     Row(kOutputFolder, "--out-dir", "DIR", &COptions::outputFolder,
-        "the folder to write to, made where it is missing"),
+        "the folder to write to, created if it is missing"),
     Row(kProfile, "--profile", "NAME|FILE", &COptions::profile,
         "an installed profile, or the path of a .prf file"),
-    Row(kJob, "--job", "htr|orn", &COptions::job, "htr converts every .bvh, orn packages every .htr",
+    Row(kJob, "--job", "htr|orn", &COptions::job, "htr converts every .bvh file, orn packages every .htr file",
         "htr|orn"),
-    Row(kFrame, "--frame", "N", &COptions::frame, "the number of the frame, from 0 on"),
-    Row(kTime, "--time", "T", &COptions::time, "a time as the controls of the file count it; may be below 0"),
-    Row(kObjects, "--objects", "", &COptions::objects, "all objects with a place, and not nodes alone"),
-    Row(kSize, "--size", "WxH", &COptions::size, "width and height in pixels, 640x480 unless told"),
+    Row(kFrame, "--frame", "N", &COptions::frame, "frame number, starting at 0"),
+    Row(kTime, "--time", "T", &COptions::time, "time in the units of the file's controls; may be negative"),
+    Row(kObjects, "--objects", "", &COptions::objects, "print all placed objects, not only nodes"),
+    Row(kSize, "--size", "WxH", &COptions::size, "width and height in pixels (default: 640x480)"),
     Row(kWith, "--with", "RESULT", &COptions::with,
-        "the motion to draw beside it, at the same share of its length"),
-    Row(kStrip, "--strip", "N", &COptions::strip, "N poses in a row; two motions one under the other"),
-    Row(kRate, "--rate", "R", &COptions::rate, "frames per second, as the package tells its reader"),
-    Row(kFrameScale, "--frame-scale", "F", &COptions::frameScale, "F times as many frames in the same time"),
-    Row(kFix, "--fix", "OUT", &COptions::fix, "write a mended copy of the .bvh, never over itself"),
-    Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's stand"),
+        "a second motion to draw next to it, at the same fraction of its length"),
+    Row(kStrip, "--strip", "N", &COptions::strip, "draw N poses in a row; a second motion goes below"),
+    Row(kRate, "--rate", "R", &COptions::rate, "frames per second to store in the package"),
+    Row(kFrameScale, "--frame-scale", "F", &COptions::frameScale, "write F times as many frames over the same time"),
+    Row(kFix, "--fix", "OUT", &COptions::fix, "write a repaired copy of the .bvh file; never overwrites the original"),
+    Row(kNoLegs, "--no-legs", "", &COptions::noLegs, "do not plant the feet where the source's feet are planted"),
     Row(kFaithful, "--faithful", "", &COptions::faithful,
-        "let hips, knees and feet keep to the source, and let feet stand still where its feet stand"),
+        "keep hips, knees and feet close to the source; pin planted feet"),
     Row(kAlign, "--align", "", &COptions::align,
-        "let bones point as the source's do, whatever its rest pose; the profile's offsets have no say"),
-    Row(kForce, "--force", "", &COptions::force, "replace a file that exists"),
+        "point bones as in the source, whatever its rest pose; ignores the profile's offsets"),
+    Row(kForce, "--force", "", &COptions::force, "replace existing files"),
     Row(kSkipExisting, "--skip-existing", "", &COptions::skipExisting,
-        "pass over a source whose output exists"),
+        "skip sources whose output exists"),
     Row(kCheck, "--check", "", &COptions::check, "measure each result against its source, as 'compare' does"),
     Row(kHtml, "--html", "PAGE", &COptions::html,
-        "write a page with figures, curves over time and the worst frames"),
-    Row(kKeepGoing, "--keep-going", "", &COptions::keepGoing, "go on with the next source where one fails"),
+        "write a page with measurements, curves over time and the worst frames"),
+    Row(kKeepGoing, "--keep-going", "", &COptions::keepGoing, "continue with the next source when one fails"),
     Row(kResume, "--resume", "", &COptions::resume,
-        "pass over a source whose output stands as an earlier --resume run made it"),
-    Row(kJobs, "--jobs", "N", &COptions::jobs, "worker processes; as many as there are cores unless told"),
+        "skip sources whose output is unchanged since an earlier --resume run"),
+    Row(kJobs, "--jobs", "N", &COptions::jobs, "number of worker processes (default: one per core)"),
     Row(kTimeLimit, "--time-limit", "S", &COptions::timeLimit,
-        "seconds after which a source that hangs is given up; 600 unless told"),
+        "give up on a source after S seconds (default: 600)"),
     Row(kFilesFrom, "--files-from", "LIST", &COptions::filesFrom,
-        "a file with a source on each line, - for standard input"),
-    Row(kNull, "-0,--null", "", &COptions::nullSeparated, "the list has zero bytes between its names"),
+        "read sources from a file, one per line; - for standard input"),
+    Row(kNull, "-0,--null", "", &COptions::nullSeparated, "names in the --files-from list are separated by zero bytes"),
     Row(kReport, "--report", "FILE", &COptions::report,
-        "write a line of JSON for every source, in order: time, frames, profile, figures, warnings"),
-    Row(kShards, "--shards", "K", &COptions::shards, "how many parts, for as many machines or more"),
-    Row(kShard, "--shard", "I", &COptions::shard, "which part, from 0 on"),
-    Row(kDryRun, "--dry-run", "", &COptions::dryRun, "say what would be done, and write nothing"),
+        "write one line of JSON per source, in order: time, frames, profile, measurements, warnings"),
+    Row(kShards, "--shards", "K", &COptions::shards, "number of shards; plan at least one per machine"),
+    Row(kShard, "--shard", "I", &COptions::shard, "shard number, starting at 0"),
+    Row(kDryRun, "--dry-run", "", &COptions::dryRun, "show what would be done, but write nothing"),
     Row(kDataFolder, "--data-dir", "DIR", &COptions::dataFolder,
-        "the folder of base.htr, KsBone.bsm and the stock profiles, in place of the program's own"),
-    Row(kJson, "--json", "", &COptions::json, "results as JSON"),
-    Row(kQuiet, "--quiet", "", &COptions::quiet, "no words but those of failures"),
+        "use base.htr, KsBone.bsm and the stock profiles in DIR instead of the installed ones"),
+    Row(kJson, "--json", "", &COptions::json, "print results as JSON"),
+    Row(kQuiet, "--quiet", "", &COptions::quiet, "print errors only"),
 };
 
 constexpr size_t kColumn = 26; // where the second column of a help begins
@@ -73,7 +73,7 @@ void AppendRow(std::string& text, std::string_view left, std::string_view right)
     text += line + std::string(right) + '\n';
 }
 
-// The option as a usage line or a help shows it: its names and what stands behind.
+// The option as shown in a usage line or a help text: its names and its value.
 std::string Shown(const COptionRow& row, std::string_view names)
 {
     return std::string(names) + (row.value.empty() ? "" : " ") + std::string(row.value);
@@ -143,7 +143,7 @@ std::string CommandHelp(const CCommand& command)
         if (OptionsOf(command) & row.bit)
             AppendRow(text, Shown(row, row.names), row.help);
     }
-    AppendRow(text, "-h,--help", "this text");
+    AppendRow(text, "-h,--help", "show this help");
     return text + "\nExample:\n  " + std::string(command.example) + '\n';
 }
 

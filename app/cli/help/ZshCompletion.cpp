@@ -83,7 +83,7 @@ std::string CommandCase(const CCommand& command)
     std::string text = "    " + std::string(command.name) + ")\n        _arguments";
     for (const COptionRow& row : OptionTable())
         text += HasOption(command, row) ? " \\\n            " + OptionWord(row) : std::string();
-    return text + " \\\n            '(-h --help)'{-h,--help}'[the help of the command]'" +
+    return text + " \\\n            '(-h --help)'{-h,--help}'[show the help of the command]'" +
            OperandWords(command) + "\n        ;;\n";
 }
 

@@ -23,10 +23,10 @@ struct FaultWords
     const char* unit;
 };
 
-// By EFault.
+// By EFrameFault.
 constexpr FaultWords kFaults[] = {
-    {"direction", "main bones off in the mean", "deg"},
-    {"kneePop",   "knee pop over the source's", "deg"},
+    {"direction", "mean error of the main bones", "deg"},
+    {"kneePop",   "knee pop beyond the source's", "deg"},
     {"slide",     "added slide",                "mm" },
 };
 

@@ -146,7 +146,7 @@ std::string Optional(const std::optional<double>& value)
 
 void PrintBones(const ConversionMeasures& measures)
 {
-    std::printf("%-14s %-20s %10s %10s %8s %12s %12s\n", "bone", "source", "mean deg", "most deg", "at frame",
+    std::printf("%-14s %-20s %10s %10s %8s %12s %12s\n", "bone", "source", "mean deg", "max deg", "at frame",
                 "jitter", "of source");
     for (const BoneMeasures& bone : measures.bones)
     {
@@ -163,7 +163,7 @@ void PrintFeet(const ConversionMeasures& measures, const char* indent)
     for (const FootMeasures& foot : measures.feet)
     {
         std::printf(
-            "%s%s: contacts %zu of %zu, F1 %s; slide added %.2f mm mean, %.2f mm most; turn %.2f deg mean; "
+            "%s%s: contacts %zu of %zu, F1 %s; added slide %.2f mm mean, %.2f mm max; turn %.2f deg mean; "
             "sole %.2f deg mean; knee pops %zu\n",
             indent, Printable(foot.target).c_str(), foot.resultContacts, foot.sourceContacts,
             Optional(foot.contactF1).c_str(), foot.addedSlideMean, foot.addedSlideLargest, foot.turnError,
@@ -175,7 +175,7 @@ void PrintFeet(const ConversionMeasures& measures, const char* indent)
 
 void PrintSums(const ConversionMeasures& measures, const char* indent)
 {
-    std::printf("%sdirections: %.3f deg mean, %.3f deg most, over %d frames\n", indent, measures.meanError,
+    std::printf("%sdirections: %.3f deg mean, %.3f deg max, over %d frames\n", indent, measures.meanError,
                 measures.largestError, measures.frameCount);
     PrintFeet(measures, indent);
     std::printf("%scontacts F1 %s; floor %s mm; sinks %.2f mm; travel ratio %s; jitter ratio %s\n", indent,

@@ -18,25 +18,25 @@ struct DoubtText
 {
     const char* name;
     const char* before;
-    const char* between; // the joint and another one; null where there is no other
+    const char* between; // the joint and another one; null if there is no other
     const char* behind;
 };
 
 // In the order of EBodyDoubt.
 constexpr DoubtText kPlaceTexts[] = {
-    {"not-below",       "",                            nullptr, " does not hang from the joint that should carry it" },
-    {"sides-swapped",   "",                            nullptr, " lies on the other side: left and right are swapped"},
-    {"clavicle-is-arm", "",                            nullptr, " lies a joint too far out for an upper arm"         },
-    {"arm-is-clavicle", "",                            nullptr, " is too short for an upper arm and looks a clavicle"},
-    {"legs-up",         "",                            nullptr, " goes up as the trunk does, and is no leg"          },
-    {"odd-length",      "the lengths of the limb of ", nullptr, " are odd"                                           },
+    {"not-below",       "",                            nullptr, " is not below the expected parent joint" },
+    {"sides-swapped",   "",                            nullptr, " is on the other side: left and right are swapped"},
+    {"clavicle-is-arm", "",                            nullptr, " is one joint too far out for an upper arm"},
+    {"arm-is-clavicle", "",                            nullptr, " is too short for an upper arm and looks like a clavicle"},
+    {"legs-up",         "",                            nullptr, " points up like the trunk, so it is not a leg"},
+    {"odd-length",      "the bone lengths in the limb of ", nullptr, " look wrong"                                           },
 };
 
-// In the order of EProfileDoubt, behind the first one.
+// In the order of EProfileDoubt, after the first one.
 constexpr DoubtText kTexts[] = {
-    {"other-name", "it takes ",                " where ", " is the joint by its name"},
-    {"spine-cut",  "the spine goes on above ", " up to ", ""                         },
-    {"turned",     "",                         nullptr,   " comes out turned across" },
+    {"other-name", "it uses ",                " although ", " is the joint by name"},
+    {"spine-cut",  "the spine continues above ", " up to ", ""                         },
+    {"turned",     "",                         nullptr,   " ends up rotated sideways" },
 };
 
 const DoubtText& TextOf(const ProfileDoubt& doubt)
@@ -53,7 +53,7 @@ std::string Sentence(const ProfileDoubt& doubt)
     return text.before + Quoted(doubt.joint) + other + text.behind;
 }
 
-// Bones that come out turned are many where one is: they share a sentence, and few of them are named.
+// If one bone ends up rotated, many do: they share a sentence that names only a few.
 std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
 {
     constexpr size_t kNamed = 4;
@@ -70,7 +70,7 @@ std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
     if (count == 0)
         return {};
     const std::string more = count > kNamed ? " and " + std::to_string(count - kNamed) + " more" : "";
-    return "bones come out turned across, which --align may mend: " + joints + more;
+    return "bones end up rotated sideways, which --align may fix: " + joints + more;
 }
 
 } // namespace
@@ -107,10 +107,10 @@ std::vector<CReport> DoubtWarnings(const std::string& source, const ProfileChoic
 
 CReport DoubtfulReport(const std::string& source, const ProfileChoice& choice)
 {
-    std::string words = "the profile that fits best, " + Quoted(choice.profile.name) + ", is doubtful";
+    std::string words = "the best-matching profile, " + Quoted(choice.profile.name) + ", is doubtful";
     for (const std::string& doubt : DoubtWords(choice.verdict))
         words += "\n  " + doubt;
-    words += "\n  name it with --profile to use it all the same, or draft one with 'gaitwright suggest'";
+    words += "\n  pass --profile to use it anyway, or draft one with 'gaitwright suggest'";
     return ShellFailure(source, "doubtful", words);
 }
 

@@ -15,7 +15,7 @@ bool IsDecidedOnExisting(const COptions& options)
 {
     if (!options.force || !options.skipExisting)
         return true;
-    SayError("--force and --skip-existing exclude each other");
+    SayError("--force and --skip-existing cannot be combined");
     return false;
 }
 

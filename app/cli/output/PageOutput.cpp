@@ -15,7 +15,7 @@ EExit CheckPagePath(const COptions& options)
         return EExit::Done;
     if (!HasExtension(path, ".html") && !HasExtension(path, ".htm"))
     {
-        SayError(Printable(path) + ": a page is an .html file");
+        SayError(Printable(path) + ": the name of a page must end in .html");
         return EExit::Usage;
     }
     return MayWrite(options, path) ? EExit::Done : EExit::Failed;
@@ -26,7 +26,7 @@ bool HasPageFolder(const COptions& options)
     const std::string folder = SplitPath(options.html).folder;
     if (options.dryRun || folder.empty() || FolderExists(folder))
         return true;
-    SayError(Printable(options.html) + ": there is no such folder");
+    SayError(Printable(options.html) + ": no such folder");
     return false;
 }
 
@@ -40,7 +40,7 @@ bool WritePage(const COptions& options, CConversionPage& page)
             "and in the folder for temporary files)");
         return false;
     }
-    SayWord(options, "the page is " + Printable(options.html));
+    SayWord(options, "page: " + Printable(options.html));
     return true;
 }
 

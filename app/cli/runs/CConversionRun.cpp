@@ -16,7 +16,7 @@ namespace {
 
 std::string OutcomeWords(EConversion outcome)
 {
-    return outcome == EConversion::Converted ? "converted, and could not be measured" : OutcomeName(outcome);
+    return outcome == EConversion::Converted ? "converted, but could not be measured" : OutcomeName(outcome);
 }
 
 } // namespace

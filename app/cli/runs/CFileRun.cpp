@@ -67,10 +67,10 @@ CReport LostReport(const CConversionJob& job, const CJobEnd& end, float limit)
     if (end.kind == CJobEnd::EKind::TimedOut)
         return ShellFailure(job.source, "time-limit",
                             "not done within " + std::to_string(static_cast<int64_t>(limit)) +
-                                " seconds, and given up; --time-limit allows more");
+                                " seconds, so it was stopped; use --time-limit to allow more");
     if (end.kind == CJobEnd::EKind::Ran)
         return ShellFailure(job.source, "no-record",
-                            "what there is to say about it cannot be kept (is there a limit on the size of "
+                            "the messages about it cannot be stored (is there a limit on the size of "
                             "files?)");
     const std::string cause = WIFSIGNALED(end.status)
                                   ? std::string(strsignal(WTERMSIG(end.status)))
@@ -140,7 +140,7 @@ std::optional<CReport> CFileRun::WhyNotReport() const
         std::ranges::any_of(m_kJobs, isReport, &CConversionJob::output) || isReport(m_kOptions.filesFrom) ||
         isReport(m_kOptions.html) || isReport(m_kOptions.profile))
         return ShellFailure(path, "in-use",
-                            "the run reads or writes this file; name another one for the report");
+                            "the run reads or writes this file; choose another file for the report");
     if (m_kOptions.resume && CReportFile::IsReport(path))
         return std::nullopt; // it says again what the first one said
     return WhyNotWrite(m_kOptions, path);
@@ -159,7 +159,7 @@ bool CFileRun::OpenState()
     m_kResume.Read(m_kState.folder);
     if (m_kOptions.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
         return true;
-    SayError(Printable(m_kState.folder) + ": what is done cannot be kept here, so that --resume cannot work");
+    SayError(Printable(m_kState.folder) + ": the records of the run cannot be written here, so --resume cannot work");
     return false;
 }
 
@@ -177,13 +177,13 @@ EExit CFileRun::Finish(bool ran, int requests)
 {
     m_kTally.left = m_kJobs.size() - std::accumulate(m_kTally.ended.begin(), m_kTally.ended.end(), size_t{0});
     if (!ran)
-        SayError("the system gives no process to work on; --jobs with a smaller number may help");
+        SayError("no worker process can be started; a smaller --jobs may help");
     if (requests > 0)
         SayError("interrupted");
     const bool isSynced = SyncResults();
     const bool good = TellEnd() && isSynced;
     if (m_bReportFailed)
-        SayError(Printable(m_kOptions.report) + ": the report cannot be written to its end");
+        SayError(Printable(m_kOptions.report) + ": the end of the report cannot be written");
     if (requests > 0)
         return EExit::Interrupted;
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
@@ -235,7 +235,7 @@ CFileRun::CFileEnd CFileRun::ConvertGuarded(const COptions& options, size_t inde
             end = Convert(options, index, text.File());
     } catch (const std::bad_alloc&)
     {
-        TellLost(index, ShellFailure(m_kJobs[index].source, "memory", "there is not enough memory for this"),
+        TellLost(index, ShellFailure(m_kJobs[index].source, "memory", "there is not enough memory"),
                  text.File());
     }
     const std::chrono::duration<double> seconds = std::chrono::steady_clock::now() - start;
@@ -275,7 +275,7 @@ CFileRun::CFileEnd CFileRun::KeepChanged(size_t index, std::string& line)
     CTextFile text;
     TellLost(index,
              ShellFailure(m_kJobs[index].output, "changed",
-                          "this file was changed after the run made it, and was kept; --force replaces it"),
+                          "this file was changed after the run wrote it, so it was kept; --force replaces it"),
              text.File());
     line = Timed(text.Text(), 0.0);
     return {.endsRun = !m_kOptions.keepGoing};

@@ -39,7 +39,7 @@ CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfil
     const std::string nearest = NearestName(name, NamesOf(profiles));
     const std::string guess = nearest.empty() ? "" : "; did you mean " + Quoted(nearest) + '?';
     return ShellFailure({}, "not-installed",
-                        "no profile " + Quoted(name) + " is installed" + guess +
+                        "profile " + Quoted(name) + " is not installed" + guess +
                             " ('gaitwright profiles' lists them)");
 }
 
@@ -244,7 +244,7 @@ bool CShellContent::SelectAdapted(const ProfileChoice& choice)
 {
     if (m_kAdapted.Write(TextOf(choice.profile)))
         return SelectProfile(m_kAdapted.Path());
-    m_kWindow.Report(ShellFailure(choice.path, "adapted", "the profile cannot be kept in a temporary file"));
+    m_kWindow.Report(ShellFailure(choice.path, "adapted", "the profile cannot be written to a temporary file"));
     return false;
 }
 

@@ -24,7 +24,7 @@ EExit ListConversions(const COptions& options, CFileRun::Jobs& jobs)
         return EExit::Usage;
     if (!jobs.empty())
         return EExit::Done;
-    SayError("there is no .bvh and no .orn to convert");
+    SayError("there are no .bvh or .orn files to convert");
     return EExit::Failed;
 }
 

@@ -146,7 +146,7 @@ bool CConversion::MayConvert()
 bool CConversion::RefuseEmpty()
 {
     m_kWindow.Report(
-        ShellFailure(m_kJob.source, "no-frames", "the motion has no frames; there is nothing to convert"));
+        ShellFailure(m_kJob.source, "no-frames", "the motion has no frames, so there is nothing to convert"));
     return false;
 }
 
@@ -217,7 +217,7 @@ void PrintChecks(const Account& account)
     if (account.check)
         PrintCheck(*account.check, "check");
     if (account.plainCheck)
-        PrintCheck(*account.plainCheck, "by the plain rules");
+        PrintCheck(*account.plainCheck, "default conversion");
 }
 
 void WriteChecks(CJsonWriter& json, const Account& account)

@@ -17,7 +17,7 @@ namespace {
 
 bool SayNoTemporary(const std::string& folder)
 {
-    SayError(Printable(folder) + ": no temporary file can be written here (check the free space and the "
+    SayError(Printable(folder) + ": a temporary file cannot be written here (check the free space and the "
                                  "permissions, or set TMPDIR to another folder)");
     return false;
 }

@@ -13,11 +13,11 @@ std::string FaultWords(const std::string& path, EPlanFault fault, size_t line)
     if (fault == EPlanFault::Unreadable)
         return path + ": the plan cannot be read (check the path and the permissions)";
     if (fault == EPlanFault::NoPlan)
-        return path + ": this is no plan; 'gaitwright plan' makes one";
+        return path + ": this is not a plan; create one with 'gaitwright plan'";
     const std::string place = path + ':' + std::to_string(line);
     if (fault == EPlanFault::TooDeep)
-        return place + ": this line is nested deeper than a plan can be; make the plan again";
-    return place + ": this line is no source of a plan; make the plan again";
+        return place + ": this line is nested too deeply for a plan; create the plan again";
+    return place + ": this line is not a valid plan entry; create the plan again";
 }
 
 } // namespace
@@ -31,7 +31,7 @@ bool LoadPlan(const std::string& path, CRunPlan& plan)
     else if (plan.version != GAITWRIGHT_VERSION)
         SayError(Printable(path) + ": version " + Printable(plan.version) +
                  " made this plan, and this is version " + GAITWRIGHT_VERSION +
-                 "; make it again, or results would differ");
+                 "; create it again, because results could differ");
     else
         return true;
     return false;

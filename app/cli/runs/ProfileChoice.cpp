@@ -12,7 +12,7 @@ CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest)
 {
     CReport report = MisfitReport(source, nearest);
     report.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
-                                         : "no installed profile fits; nearest comes " + report.words;
+                                         : "no installed profile fits; the closest is " + report.words;
     return report;
 }
 

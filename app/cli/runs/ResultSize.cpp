@@ -50,7 +50,7 @@ std::optional<CReport> WhyTooLarge(const CShellContent& content, const CConversi
     std::snprintf(
         words, sizeof words,
         "the result would take at least %.1f GiB (%.0f rows for each of %.0f bones), and a .Kinetra "
-        "holds less than 2 GiB; split the motion, or write an .htr, which has no such limit",
+        "must be smaller than 2 GiB; split the motion, or write an .htr, which has no such limit",
         bytes / 1073741824.0, rows, bones);
     return ShellFailure(job.source, "too-large", words);
 }

@@ -19,15 +19,15 @@ bool IsRunPossible(const COptions& options)
 {
     const char* words = nullptr;
     if (options.jobs && (*options.jobs < 1 || *options.jobs > kWorkerLimit))
-        words = "--jobs takes a number from 1 to 1024";
+        words = "--jobs must be a number from 1 to 1024";
     else if (options.resume && options.skipExisting)
-        words = "--resume and --skip-existing exclude each other";
+        words = "--resume and --skip-existing cannot be combined";
     else if (options.dryRun && !options.report.empty())
-        words = "--dry-run writes nothing, and so no --report";
+        words = "--dry-run writes nothing, so it cannot be combined with --report";
     else if (options.nullSeparated && options.filesFrom.empty())
-        words = "--null says how the list of --files-from is divided, and there is none";
+        words = "--null needs a list; pass one with --files-from";
     else if (options.resume && options.outputFolder.empty() && options.files.empty())
-        words = "--resume keeps what is done in the output folder; name one with --out-dir";
+        words = "--resume keeps its records in the output folder; pass --out-dir DIR";
     if (words)
         SayError(words);
     return !words;
@@ -40,7 +40,7 @@ bool AreOutputsApart(const CFileRun::Jobs& jobs)
     {
         if (outputs.insert(job.output).second)
             continue;
-        SayError(Printable(job.source) + ": another source becomes " + Printable(job.output) + " too");
+        SayError(Printable(job.source) + ": another source would also be written to " + Printable(job.output));
         return false;
     }
     return true;
@@ -50,7 +50,7 @@ bool MakeOutputFolder(const COptions& options)
 {
     if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
         return true;
-    SayError(Printable(options.outputFolder) + ": the folder cannot be made");
+    SayError(Printable(options.outputFolder) + ": the folder cannot be created");
     return false;
 }
 

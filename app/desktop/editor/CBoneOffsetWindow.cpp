@@ -59,7 +59,7 @@ QLayout* CBoneOffsetWindow::MakeNumbers(const CGaitConvertContent& content)
 {
     auto* const grid = new QGridLayout;
     grid->addWidget(MakeHeading(tr("Rotation in degrees"), QStringLiteral("rotations")), 0, 1);
-    grid->addWidget(MakeHeading(tr("Takes source axis"), QStringLiteral("axes")), 0, 4);
+    grid->addWidget(MakeHeading(tr("From source axis"), QStringLiteral("axes")), 0, 4);
     for (int axis = 0; axis < kAxisCount; ++axis)
     {
         QWidget* const rotation = MakeRotation(axis);

@@ -39,7 +39,7 @@ EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons butto
 void CContent::ShowNotes()
 {
     RunMessageBox(this, m_pkLogic->Message(kTitleMessage),
-                  ToUtf8(QCoreApplication::translate("Face", "Notes on the last step")), EButtons::OK,
+                  ToUtf8(QCoreApplication::translate("Face", "Warnings from the last step")), EButtons::OK,
                   Notes(), EDetails::Unfolded);
 }
 

@@ -119,7 +119,7 @@ bool CSkin::ReadLayout(std::string_view text, std::string& problem)
             continue;
         }
         problem =
-            m_kFolder + kLayoutFile + ":" + std::to_string(number) + ": not understood: " + Printable(line);
+            m_kFolder + kLayoutFile + ":" + std::to_string(number) + ": invalid line: " + Printable(line);
         return false;
     }
     return true;
@@ -129,7 +129,7 @@ bool CSkin::HasAllParts(std::string& problem) const
 {
     if (m_kSize.isEmpty())
     {
-        problem = m_kFolder + kLayoutFile + " names no size.";
+        problem = m_kFolder + kLayoutFile + " has no size.";
         return false;
     }
     for (const std::string_view name : kNeededChildren)

@@ -59,9 +59,9 @@ QWidget* MakeView(const CLeftKeys& keys, QWidget* face)
     if (HasOpenGL())
         return new CPreviewWidget(keys, face);
     auto* const words =
-        new QLabel(QCoreApplication::translate("Face", "There is no OpenGL on this screen, so motions "
-                                                       "cannot be shown.\nOpening, converting and "
-                                                       "saving work all the same."),
+        new QLabel(QCoreApplication::translate("Face", "OpenGL is not available, so motions cannot "
+                                                       "be shown.\nOpening, converting and saving "
+                                                       "still work."),
                    face);
     words->setAlignment(Qt::AlignCenter);
     words->setWordWrap(true);

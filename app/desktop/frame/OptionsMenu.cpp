@@ -18,13 +18,13 @@ struct Choice
 constexpr Choice kChoices[] = {
     {QT_TRANSLATE_NOOP("OptionsMenu", "Align the rest pose"),
      QT_TRANSLATE_NOOP("OptionsMenu",
-     "Tells the source from a T-pose first: for A-poses, arms that hang, bone "
-                       "frames that stand turned and joints whose positions repeat"),
+     "Re-expresses the source relative to a T-pose first: for A-poses, arms down, "
+                       "rotated bone frames, and positions that repeat the offsets"),
      &ConversionChoices::align   },
     {QT_TRANSLATE_NOOP("OptionsMenu", "Faithful hips, knees and feet"),
      QT_TRANSLATE_NOOP("OptionsMenu",
-     "Hips stand and travel as the source's do, knees bend in its planes, feet "
-                       "turn as its feet and stand still where they stand"),
+     "Matches the source's hip height and travel, scaled by leg length; knees bend "
+                       "and feet turn as in the source, and planted feet do not slide"),
      &ConversionChoices::faithful},
 };
 
@@ -54,7 +54,7 @@ QMenu* MakeOptionsMenu(CGaitConvertContent& logic, QWidget* owner)
     QAction* const draft =
         menu->addAction(QCoreApplication::translate("OptionsMenu", "Draft a bone map for this source"));
     draft->setToolTip(QCoreApplication::translate(
-        "OptionsMenu", "By the names of its joints, else by its shape; opens in the editor"));
+        "OptionsMenu", "Finds joints by name, or else by shape; opens the result in the editor"));
     draft->setEnabled(logic.SourceRoot() != nullptr);
     QObject::connect(draft, &QAction::triggered, menu, [&logic] { logic.DraftProfile(); });
     return menu;

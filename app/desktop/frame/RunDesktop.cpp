@@ -31,10 +31,10 @@ constexpr const char* kTargetFile = "base.htr";
 constexpr const char* kUsage =
     "Usage: GaitForge [FILE]\n"
     "       GaitForge -s                        the map tool\n"
-    "       GaitForge --reset-instance-counter  after a crash that blocks every start\n";
+    "       GaitForge --reset-instance-counter  clear the lock after a crash\n";
 
 constexpr const char* kBlocked =
-    "GaitForge: another one is said to run, but none answers. If it has crashed, this sets things right:\n"
+    "GaitForge: another instance seems to be running, but it does not respond. If it crashed, run:\n"
     "GaitForge --reset-instance-counter\n";
 
 // Says what keeps the program from working, in a window and for whoever started it from a shell.
@@ -57,7 +57,7 @@ void CheckTarget(const CPlatform& platform)
     const std::string path = platform.DataFolder() + kTargetFile;
     if (!FileExists(path))
         Complain("The target skeleton \"" + path +
-                 "\" is missing. Motions can be looked at, and none can be converted.");
+                 "\" is missing. You can view motions, but not convert them.");
 }
 
 // Copies of the program in different folders do not know of each other.
@@ -169,7 +169,7 @@ int RunDesktop(int argc, char** argv)
     if (!HasDisplay())
     {
         std::fputs(
-            "GaitForge: there is no display to show a window on; the program \"gaitwright\" needs none\n",
+            "GaitForge: there is no display for a window; the program \"gaitwright\" does not need one\n",
             stderr);
         return EXIT_FAILURE;
     }

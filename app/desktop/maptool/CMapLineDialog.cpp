@@ -31,15 +31,15 @@ struct Template
 
 constexpr Template kTemplates[] = {
     {EMapLine::Mapping,   158, QT_TRANSLATE_NOOP("GaitTool", "Rotation"),
-     QT_TRANSLATE_NOOP("GaitTool", "Degrees about each axis")},
+     QT_TRANSLATE_NOOP("GaitTool", "Degrees around each axis")},
     {EMapLine::Position,  159, QT_TRANSLATE_NOOP("GaitTool", "Position"),
-     QT_TRANSLATE_NOOP("GaitTool", "Where the root begins")  },
+     QT_TRANSLATE_NOOP("GaitTool", "Start position of the root")},
     {EMapLine::FrameRate, 160, QT_TRANSLATE_NOOP("GaitTool", "Frame Rate"),
      QT_TRANSLATE_NOOP("GaitTool", "Frames per second")      },
     {EMapLine::Fixed,     161, QT_TRANSLATE_NOOP("GaitTool", "Name"),
-     QT_TRANSLATE_NOOP("GaitTool", "The line as it stands")  },
+     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")},
     {EMapLine::Text,      161, QT_TRANSLATE_NOOP("GaitTool", "Name"),
-     QT_TRANSLATE_NOOP("GaitTool", "The line as it stands")  },
+     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")},
 };
 
 constexpr const char* kAxisNames[] = {"X", "Y", "Z"};

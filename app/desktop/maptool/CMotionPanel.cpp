@@ -37,11 +37,11 @@ struct TransportButton
 
 // In the order of kTransportIds.
 constexpr TransportButton kTransportButtons[] = {
-    {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "To the first frame")},
-    {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "One frame back")    },
+    {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "First frame")       },
+    {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "Previous frame")    },
     {EButtonIcon::Stop,        QT_TRANSLATE_NOOP("GaitTool", "Stop")              },
     {EButtonIcon::Play,        QT_TRANSLATE_NOOP("GaitTool", "Play")              },
-    {EButtonIcon::StepForward, QT_TRANSLATE_NOOP("GaitTool", "One frame on")      },
+    {EButtonIcon::StepForward, QT_TRANSLATE_NOOP("GaitTool", "Next frame")        },
 };
 
 QString CaptionOf(EToolMotion motion)

@@ -94,7 +94,7 @@ void CGaitToolWindow::MakeMenu()
 void CGaitToolWindow::MakeTop(QGridLayout& grid)
 {
     auto* const hint =
-        new QLabel(Translated("Select a bone in each tree and add the pair to the map; then convert."), this);
+        new QLabel(Translated("Select a bone in each tree and add the pair to the map. Then convert."), this);
     hint->setObjectName(QStringLiteral("hint"));
     hint->setProperty("kind", QStringLiteral("caption"));
     grid.addWidget(hint, kTopRow, 0, 1, kColumns - 1);

@@ -87,11 +87,11 @@ void CInstanceServer::Attend(QLocalSocket& socket)
 void CInstanceServer::Receive(QLocalSocket& socket)
 {
     std::string path;
-    const EMessage message = ReadMessage(socket.peek(socket.bytesAvailable()), path);
-    if (message == EMessage::Partial)
+    const EMessageState message = ReadMessage(socket.peek(socket.bytesAvailable()), path);
+    if (message == EMessageState::Partial)
         return;
     socket.disconnect(this);
-    if (message == EMessage::Wrong)
+    if (message == EMessageState::Wrong)
     {
         socket.abort();
         return;

@@ -29,23 +29,23 @@ QByteArray MakeMessage(const std::string& path)
     return QByteArray(head, kMessageHead) + bytes;
 }
 
-EMessage ReadMessage(const QByteArray& bytes, std::string& path)
+EMessageState ReadMessage(const QByteArray& bytes, std::string& path)
 {
     const qsizetype letters = std::min(bytes.size(), kLetterCount);
     if (!std::equal(kLetters, kLetters + letters, bytes.begin()))
-        return EMessage::Wrong;
+        return EMessageState::Wrong;
     if (bytes.size() < kMessageHead)
-        return EMessage::Partial;
+        return EMessageState::Partial;
     const qsizetype length = qFromLittleEndian<quint32>(bytes.constData() + kLetterCount);
     const QByteArrayView rest = QByteArrayView(bytes).sliced(kMessageHead);
     if (length > kLongestPath || rest.size() > length)
-        return EMessage::Wrong;
+        return EMessageState::Wrong;
     if (rest.size() < length)
-        return EMessage::Partial;
+        return EMessageState::Partial;
     if (!IsPath(rest))
-        return EMessage::Wrong;
+        return EMessageState::Wrong;
     path.assign(rest.data(), static_cast<size_t>(rest.size()));
-    return EMessage::Whole;
+    return EMessageState::Whole;
 }
 
 } // namespace gw

@@ -14,7 +14,7 @@ inline constexpr qsizetype kLongestPath = 4096; ///< bytes; no file has a longer
 inline constexpr char kMessageAnswer = '!';     ///< what the first instance says when it has understood
 
 /// How far a message has come.
-enum class EMessage : uint8_t
+enum class EMessageState : uint8_t
 {
     Partial, ///< more may come
     Whole,
@@ -25,6 +25,6 @@ enum class EMessage : uint8_t
 QByteArray MakeMessage(const std::string& path);
 
 /// Reads what has arrived so far; only a whole message sets the path.
-EMessage ReadMessage(const QByteArray& bytes, std::string& path);
+EMessageState ReadMessage(const QByteArray& bytes, std::string& path);
 
 } // namespace gw
