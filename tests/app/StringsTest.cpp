@@ -165,7 +165,7 @@ TEST(FailureWords, AReportSaysWhereAndWhatToDo)
     } rows[] = {
         {"a line",
          "a.bvh",   {EFailure::BlankLine, 12, "Frames:"},
-         "a.bvh:12: an empty line where this keyword must stand: \"Frames:\" (remove the empty line)"},
+         "a.bvh:12: expected this keyword, but found an empty line: \"Frames:\" (remove the empty line)"},
         {"a byte of a container",
          "a.orn",   {EFailure::UnknownClass, 381, "CSpoon"},
          "a.orn: byte 381: the file contains an object of an unknown class: \"CSpoon\""     },

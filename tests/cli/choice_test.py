@@ -57,7 +57,7 @@ class Choice(CliTest):
         result = self.succeed("convert", "a.bvh", "-o", "a.htr")
         self.assertIn("10 spine joints", result.out)
         self.assertIn(", likely", result.out)
-        self.assert_words(result, ['the spine goes on above "Spine9" up to "Spine11"'])
+        self.assert_words(result, ['the spine continues above "Spine9" up to "Spine11"'])
 
     def test_profiles_are_listed_as_they_are_taken(self):
         rows = [  # what, source, the first profile's name, its sureness, kinds of doubt

@@ -39,7 +39,7 @@ DAMAGED = [  # what, content, words
     ("a name that the file cannot hold", skeleton().replace(struct.pack("<I", 5) + b"Group",
                                                             struct.pack("<I", 0xffffffff) + b"Group"),
      ["damaged at byte"]),
-    ("nodes that hold each other", ring(), ["damaged", "ring"]),
+    ("nodes that hold each other", ring(), ["damaged", "cycle"]),
     ("nesting without end", lattice(200), ["damaged", "limit"]),
 ]
 

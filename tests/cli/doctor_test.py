@@ -74,13 +74,13 @@ class Doctor(CliTest):
         self.write("ill.bvh", SHORT.replace("JOINT Chest", "JOINT My Chest"))
         result = self.run_program("doctor", "ill.bvh", "--fix", "better.bvh")
         self.assertEqual(result.code, FAILED)
-        self.assertIn("ill.bvh -> better.bvh: mended, but these faults are left\nbetter.bvh:20: short-row", result.out)
+        self.assertIn("ill.bvh -> better.bvh: repaired, but these faults are left\nbetter.bvh:20: short-row", result.out)
 
     def test_where_nothing_can_be_mended_no_copy_is_written(self):
         self.write("ill.bvh", SHORT)
         result = self.run_program("doctor", "ill.bvh", "--fix", "out.bvh")
         self.assertEqual(result.code, FAILED)
-        self.assert_words(result, ["nothing of this can be mended"])
+        self.assert_words(result, ["none of these faults can be repaired"])
         self.assertEqual(self.files(), ["ill.bvh"])
 
     def test_fix_refuses_what_it_must(self):
@@ -94,7 +94,7 @@ class Doctor(CliTest):
             ("in place by a link", ["ill.bvh", "--fix", "link.bvh", "--force"], USAGE, "in place"),
             ("over a file", ["ill.bvh", "--fix", "old.bvh"], FAILED, "--force"),
             ("no such folder", ["ill.bvh", "--fix", "none/out.bvh"], FAILED, "cannot be written"),
-            ("no such file", ["none.bvh", "--fix", "out.bvh"], FAILED, "mended"),
+            ("no such file", ["none.bvh", "--fix", "out.bvh"], FAILED, "repaired"),
         ]
         before = self.read("ill.bvh")
         for what, arguments, code, word in rows:
@@ -113,7 +113,7 @@ class Doctor(CliTest):
             ("b.htr", htr("2 1 0 0 0 0 90 1", "2 nan 0 0 0 0 90 1"), FAILED, "b.htr:25: bad-number: "),
             ("c.cha", CHA, DONE, "c.cha: 2 joints"),
             ("d.chb", chb()[:-1], FAILED, "d.chb: byte "),
-            ("e.orn", scene, DONE, "e.orn: whole; "),
+            ("e.orn", scene, DONE, "e.orn: intact; "),
             ("f.orn", scene[:-20], FAILED, "f.orn: byte "),
             ("g.orn", pointer, FAILED, "g.orn: byte 1: lfs-pointer: "),
             ("h.htr", pointer, FAILED, "h.htr:1: lfs-pointer: "),

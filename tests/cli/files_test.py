@@ -23,7 +23,7 @@ BROKEN = [  # what, content, line or 0, word of the sentence
     ("an empty file", "", 0, '"HIERARCHY"'),
     ("no BVH at all", "\x00\x01\x02" * 100, 1, '"HIERARCHY"'),
     ("a name that a zero byte ends", bvh("Chest", "\0Chest"), 6, "zero byte"),
-    ("more channels than words", bvh("CHANNELS 3 Z", "CHANNELS 999999999 Z"), 9, "fewer values"),
+    ("more channels than words", bvh("CHANNELS 3 Z", "CHANNELS 999999999 Z"), 9, "too few values"),
     ("no number in a row", bvh(ROW, "1 90 nan 0 0 0 90 0 0"), 20, '"nan"'),
     ("a hundred thousand levels", nested(100000), 0, "deep"),
 ]

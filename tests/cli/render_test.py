@@ -84,7 +84,7 @@ class Refusals(CliTest):
             ("more poses than pixels", USAGE, ["take.bvh", "--size", "9x9", "--strip", "10"], ["10 poses", "9x9"]),
             ("more poses than any number", USAGE, ["take.bvh", "--strip", "4294967297"], ["4294967297 poses"]),
             ("another kind of picture", USAGE, ["take.bvh", "-o", "out.jpg"], ["out.jpg", ".png"]),
-            ("contrary wishes", USAGE, ["take.bvh", "--force", "--skip-existing"], ["exclude each other"]),
+            ("contrary wishes", USAGE, ["take.bvh", "--force", "--skip-existing"], ["cannot be combined"]),
             ("a picture that is there", FAILED, ["take.bvh", "-o", "old.png"], ["old.png", "--force"]),
             ("no such motion", FAILED, ["none.bvh"], ["none.bvh"]),
             ("no such result", FAILED, ["take.bvh", "--with", "none.htr"], ["none.htr"]),

@@ -299,7 +299,7 @@ class Resumed(RunTest):
                 self.assertEqual((self.read(name), (self.folder / "out/a").exists()), (before, False))
         result = self.convert("--report", "/dev/full", "--force")
         self.assertEqual((result.code, len(self.results())), (FAILED, TAKES))
-        self.assertIn("/dev/full: the report cannot be written", result.err)
+        self.assertIn("/dev/full: the end of the report cannot be written", result.err)
 
     def test_the_line_of_a_single_file_goes_to_a_report_too(self):
         self.succeed("convert", WALK, "-o", "walk.htr", "--report", "report.jsonl")

@@ -68,7 +68,7 @@ class Shards(CliTest):
         self.write("plan.shard-0.jsonl", first + b"\n" + DEEP + rest)
         self.write("many/.gaitwright.resume.deep.jsonl", DEEP)
         merged = self.run_program("merge-report", "plan.jsonl", "-o", "all.jsonl")
-        self.assertIn("plan.shard-0.jsonl:2: this line is nested deeper", merged.err)
+        self.assertIn("plan.shard-0.jsonl:2: this line is nested too deeply", merged.err)
         self.assertEqual(self.read("all.jsonl").count(b"\n"), TAKES)
         self.assertIn("%d skipped" % (TAKES - 1), self.with_assets("run", "plan.jsonl", "--shard", 0).err)
 
@@ -102,19 +102,19 @@ class Shards(CliTest):
         plan = self.read("plan.jsonl")
         head, first, rest = plan.split(b"\n", 2)
         rows = [  # what, plan, words
-            ("nothing", b"", "no plan"),
-            ("a motion", WALK.read_bytes(), "no plan"),
-            ("no shards", plan.replace(b'"shards":3', b'"shards":0'), "no plan"),
-            ("too many shards", plan.replace(b'"shards":3', b'"shards":99999999999'), "no plan"),
-            ("another version", plan.replace(b'"version":"', b'"version":"9'), "make it again"),
+            ("nothing", b"", "not a plan"),
+            ("a motion", WALK.read_bytes(), "not a plan"),
+            ("no shards", plan.replace(b'"shards":3', b'"shards":0'), "not a plan"),
+            ("too many shards", plan.replace(b'"shards":3', b'"shards":99999999999'), "not a plan"),
+            ("another version", plan.replace(b'"version":"', b'"version":"9'), "create it again"),
             ("an option that there is not", plan.replace(b'"options":{', b'"options":{"--magic":true'), "--magic"),
             ("an option of another kind", plan.replace(b'"options":{', b'"options":{"--no-legs":"no"'), "--no-legs"),
             ("an option that is for the run", plan.replace(b'"options":{', b'"options":{"--jobs":3'), "--jobs"),
             ("a cut line", head + b"\n" + first[:-9] + b"\n" + rest, "wrong.jsonl:2:"),
             ("a shard that there is not", plan.replace(b'"shard":1', b'"shard":3'), "wrong.jsonl:"),
-            ("deep", b"[" * 100_000, "wrong.jsonl:1: this line is nested deeper"),
-            ("a deep line", plan + DEEP, "wrong.jsonl:%d: this line is nested deeper" % (TAKES + 2)),
-            ("deep options", plan.replace(b'"options":{', b'"options":{"--x":' + DEEP[5:-2]), "nested deeper"),
+            ("deep", b"[" * 100_000, "wrong.jsonl:1: this line is nested too deeply"),
+            ("a deep line", plan + DEEP, "wrong.jsonl:%d: this line is nested too deeply" % (TAKES + 2)),
+            ("deep options", plan.replace(b'"options":{', b'"options":{"--x":' + DEEP[5:-2]), "nested too deeply"),
         ]
         for what, text, words in rows:
             with self.subTest(what):

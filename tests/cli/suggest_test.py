@@ -103,7 +103,7 @@ class Suggest(CliTest):
                 told = self.succeed("convert", path, "-o", "a.htr", "--profile", "a.prf", "--force").err
                 facts = json.loads(self.run_program("doctor", path, "--json").out)["facts"]
                 pose = REST_POSES.get(path.stem, "T-pose")
-                self.assertEqual((facts["restPose"], profile["restIsStance"], "the rest pose is no T-pose" in told),
+                self.assertEqual((facts["restPose"], profile["restIsStance"], "the rest pose is not a T-pose" in told),
                                  (pose, pose != "none", pose != "T-pose"))
 
 

@@ -264,7 +264,7 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     WriteBytes(broken, twofold);
     person.WillAnswer("ok");
     person.Drop(broken);
-    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("a blank"))
+    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("contains a space"))
         << "all that is wrong is told, not just what came first";
     EXPECT_TRUE(person.IsOn("convert")) << "the source before stays";
 }

@@ -19,13 +19,13 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
         std::string text;
         const char* words;
     } rows[] = {
-        {"bvh.cnt", "",                                 "names no size"        },
+        {"bvh.cnt", "",                                 "has no size"          },
         {"bvh.cnt", withoutBar,                         "no child \"|playbar\""},
-        {"bvh.cnt", layout + "button x 1 2 three 4\n",  "not understood"       },
-        {"bvh.cnt", layout + "button x 1 2 0 4\n",      "not understood"       },
-        {"bvh.cnt", layout + "knob x 1 2 3 4\n",        "not understood"       },
+        {"bvh.cnt", layout + "button x 1 2 three 4\n",  "invalid line"         },
+        {"bvh.cnt", layout + "button x 1 2 0 4\n",      "invalid line"         },
+        {"bvh.cnt", layout + "knob x 1 2 3 4\n",        "invalid line"         },
         {"bvh.cnt", layout + "button x 1 2 3 4 none\n", "icons/none.svg"       },
-        {"bvh.cnt", "size 1 99999\n" + layout,          "not understood"       },
+        {"bvh.cnt", "size 1 99999\n" + layout,          "invalid line"         },
     };
     for (const auto& row : rows)
     {

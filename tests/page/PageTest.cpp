@@ -118,8 +118,8 @@ TEST(Page, ShowsTheFramesOfMadeFaultsWithBothSkeletons)
 {
     const std::string page = CMadeConversion(kFaulty).Page();
     ExpectBalanced(page);
-    EXPECT_TRUE(Has(page, "<b>Frame 20</b> main bones"));
-    EXPECT_TRUE(Has(page, "most of all LForearm, 60.0°"));
+    EXPECT_TRUE(Has(page, "<b>Frame 20</b> mean error of the main bones"));
+    EXPECT_TRUE(Has(page, "largest at LForearm, 60.0°"));
     EXPECT_TRUE(Has(page, "<b>Frame 35</b> the knee above LFoot jumps by 14.0°"));
     const size_t frames = Count(page, "<article>");
     EXPECT_EQ(frames, 3u);
