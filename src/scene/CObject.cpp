@@ -9,9 +9,8 @@
 #include "HTMLMarkup.h"
 #include "HTMLText.h"
 
+#include <algorithm>
 #include <cstring>
-#include <iterator>
-#include <span>
 #include <unordered_set>
 
 namespace gw {
@@ -60,41 +59,35 @@ void ForEachModifier(CObject* head, F visit)
         visit(*modifier);
 }
 
-// The objects that one keeps alive. Collected first and visited then, so that walks which recurse spend one
-// small frame a level; every search comes by here, so that the usual number needs no allocation.
-class CHeldObjects
+// Appends the objects that one keeps alive, in the order of its fields.
+void AppendHeld(CObject& object, std::vector<CObject*>& held)
 {
-public:
-    explicit CHeldObjects(CObject& object)
-    {
-        CLinkVisitor visitor([this](const CLinkSlot& slot) {
-            if (CObject* held = slot.IsCounted() ? slot.Get() : nullptr)
-                Add(held);
-        });
-        object.Fields(visitor);
-    }
-    std::span<CObject* const> All() const
-    {
-        return m_kMany.empty() ? std::span<CObject* const>(m_apkFew, m_uiFew) : m_kMany;
-    }
+    CLinkVisitor visitor([&held](const CLinkSlot& slot) {
+        if (CObject* const linked = slot.IsCounted() ? slot.Get() : nullptr)
+            held.push_back(linked);
+    });
+    object.Fields(visitor);
+}
 
-private:
-    void Add(CObject* object)
+// The first object that fits, of one and everything that it keeps alive: each before what it holds, and once
+// for each of its places. The list of what lies ahead takes the place of a recursion, which deep graphs could
+// exhaust the stack with.
+template <class F>
+CObject* FindHeld(CObject& start, F fits)
+{
+    std::vector<CObject*> ahead{&start};
+    while (!ahead.empty())
     {
-        if (m_kMany.empty() && m_uiFew < std::size(m_apkFew))
-        {
-            m_apkFew[m_uiFew++] = object;
-            return;
-        }
-        if (m_kMany.empty())
-            m_kMany.assign(m_apkFew, m_apkFew + m_uiFew);
-        m_kMany.push_back(object);
+        CObject* const object = ahead.back();
+        ahead.pop_back();
+        if (fits(*object))
+            return object;
+        const auto end = static_cast<std::ptrdiff_t>(ahead.size());
+        AppendHeld(*object, ahead);
+        std::reverse(ahead.begin() + end, ahead.end());
     }
-
-    CObject* m_apkFew[6];
-    size_t m_uiFew = 0;
-    std::vector<CObject*> m_kMany; // all, where they are too many
-};
+    return nullptr;
+}
 
 template <class F>
 void UpdateChains(CObject& object, F update)
@@ -285,30 +278,23 @@ bool CObject::Fits(const char* name, const CRTTI* record, bool derived) const
 
 std::vector<CObject*> CObject::HeldObjects()
 {
-    const CHeldObjects held(*this);
-    return {held.All().begin(), held.All().end()};
+    std::vector<CObject*> held;
+    AppendHeld(*this, held);
+    return held;
 }
 
 CObject* CObject::FindObject(const char* name, const CRTTI* record, bool derived)
 {
-    if (Fits(name, record, derived))
-        return this;
-    const CHeldObjects all(*this);
-    for (CObject* held : all.All())
-    {
-        if (CObject* found = held->FindObject(name, record, derived))
-            return found;
-    }
-    return nullptr;
+    return FindHeld(*this, [=](const CObject& object) { return object.Fits(name, record, derived); });
 }
 
 void CObject::FindObjects(std::vector<CObject*>& found, const char* name, const CRTTI* record, bool derived)
 {
-    if (Fits(name, record, derived))
-        found.push_back(this);
-    const CHeldObjects all(*this);
-    for (CObject* held : all.All())
-        held->FindObjects(found, name, record, derived);
+    FindHeld(*this, [&](CObject& object) {
+        if (object.Fits(name, record, derived))
+            found.push_back(&object);
+        return false;
+    });
 }
 
 void CObject::AppendBindOrder(std::vector<CObject*>& order)
