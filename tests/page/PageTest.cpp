@@ -230,12 +230,12 @@ TEST(Page, SeveralMotionsBeginWithATableOfTheWorst)
     EXPECT_EQ(Count(text, "<section id=\"motion"), 2u);
 }
 
-// The column of the plain rules stands where there is such a measuring, and not elsewhere.
+// The column of the default conversion appears only if that conversion was measured.
 TEST(Page, SetsTheChoicesAgainstThePlainRules)
 {
     CMadeConversion plain([](CMadeFigure& figure, int) { figure.Turn("LForearm", kVec3UnitZ, 33.0); });
     CMadeConversion chosen(kStill);
-    EXPECT_FALSE(Has(chosen.Page(), "plain rules"));
+    EXPECT_FALSE(Has(chosen.Page(), "default"));
     chosen.Motion().plain = &plain.Measured();
     const std::string page = chosen.Page();
     EXPECT_TRUE(Has(page, "<th>default °</th>"));

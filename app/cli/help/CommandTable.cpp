@@ -102,7 +102,7 @@ constexpr CCommand kCommands[] = {
         "up axis, rest pose, how the body was found. The exit code is 1 if there is a fault.\n"
         "--fix writes a copy of one .bvh file without the faults that can be repaired without changing the\n"
         "motion. The copy is checked too, and the exit code is for the copy.",
-        "gaitwright doctor walk.bvh --fix mended.bvh"),
+        "gaitwright doctor walk.bvh --fix repaired.bvh"),
     Row("profiles", "[SOURCE]", 0, 0, RunProfiles,
         "List the installed profiles; with a source, show which ones fit and what the others lack.\n"
         "'convert' uses the first one. For each profile that fits, the list shows its confidence (sure,\n"
