@@ -350,44 +350,6 @@ TEST(CSafeFile, SymbolicLinksAreFollowed)
         EXPECT_TRUE(fs::is_symlink(folder.Path(link))) << link;
 }
 
-TEST(CSafeFile, WhatIsToBeKeptIsNotReplacedThoughItAppearedMeanwhile)
-{
-    const CTempFolder folder;
-    const std::string path = folder.Path("a");
-    const struct
-    {
-        const char* what;
-        bool isKept, isThere, appears;
-        EFailure failure;
-        const char* text;
-    } rows[] = {
-        {"free",            true,  false, false, EFailure::None,   "new"  },
-        {"there before",    true,  true,  false, EFailure::Exists, "other"},
-        {"there meanwhile", true,  false, true,  EFailure::Exists, "other"},
-        {"may be replaced", false, false, true,  EFailure::None,   "new"  },
-    };
-    for (const auto& row : rows)
-    {
-        SCOPED_TRACE(row.what);
-        fs::remove(path);
-        if (row.isKept)
-            CSafeFile::KeepExisting(path);
-        if (row.isThere)
-            WriteBytes(path, "other");
-        CSafeFile file;
-        const bool isOpen = file.Open(path) && file.Write("new");
-        if (row.appears)
-            WriteBytes(path, "other");
-        EXPECT_EQ(isOpen && file.Commit(), row.failure == EFailure::None);
-        EXPECT_EQ(file.Failure(), row.failure);
-        EXPECT_EQ(ReadBytes(path), row.text);
-        EXPECT_EQ(EntryCount(folder), 1u);
-    }
-    fs::create_symlink("nowhere", folder.Path("dangling"));
-    CSafeFile::KeepExisting(folder.Path("dangling"));
-    EXPECT_FALSE(Save(folder.Path("dangling"), "new"));
-}
-
 TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
 {
     const CTempFolder folder;

@@ -1,0 +1,254 @@
+// The lines of the map tool: editing, loading and saving them, and what they do to a conversion.
+
+#include "ToolFixture.h"
+
+#include <regex>
+
+namespace gw {
+
+TEST_F(ToolTest, AddedLinesStandBehindTheHead)
+{
+    LoadSource();
+    Add("hip", "LowerTorso");
+    Add("lThigh", "LThigh");
+    EXPECT_EQ(Lines(), std::string(kHead) + "hip <---> LowerTorso .|lThigh <---> LThigh .|");
+    EXPECT_EQ(Marked(), " hip  lThigh > LowerTorso  LThigh ");
+    EXPECT_EQ(m_kTool.Map().FrameRate(), 60);
+}
+
+TEST_F(ToolTest, ALineThatSpeaksOfPositionIsAHeadAndSetsNothingUnlessItBeginsSo)
+{
+    LoadSource();
+    LoadMap("Composition 7,8,9|");
+    Add("hip", "LowerTorso");
+    EXPECT_EQ(Lines(), "Composition 7,8,9|hip <---> LowerTorso .|");
+    EXPECT_EQ(m_kTool.Map().RootPosition(), kVec3Zero);
+}
+
+TEST_F(ToolTest, LoadedLinesStandAsTheyWereButForUnknownBones)
+{
+    LoadSource();
+    Add("rFoot", "RFoot");
+    LoadMap("Walk|FrameRate 24|POSITION 1 -2 3.5||x <---> LThigh .|hip <---> LowerTorso .|* Head|lThigh "
+            "<---> y .|");
+    EXPECT_EQ(Lines(), "Walk|FrameRate 24|POSITION 1 -2 3.5||hip <---> LowerTorso .|* Head|");
+    EXPECT_EQ(m_kTool.Map().RootPosition(), (Vec3{1, -2, 3.5f}));
+    EXPECT_EQ(m_kTool.Map().FrameRate(), 24);
+    EXPECT_EQ(Marked(), " hip > LowerTorso ") << "markers of the lines before are gone";
+    EXPECT_EQ(m_kTool.Status(), "map.txt: 6 lines; 2 mappings without a bone here left out");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.prf;|Nap Files |*.txt;||");
+
+    LoadMap("hip <---> LowerTorso .|Position 4,5,6|");
+    EXPECT_EQ(Lines(), std::string(kHead) + "hip <---> LowerTorso .|Position 4,5,6|");
+    EXPECT_EQ(m_kTool.Map().RootPosition(), (Vec3{4, 5, 6})) << "behind the head that was put before";
+
+    Click(kToolLoadMap, "none.txt");
+    EXPECT_EQ(m_kTool.Map().Lines().size(), 5u);
+    EXPECT_EQ(m_kTool.Status().find("none.txt: "), 0u);
+}
+
+TEST_F(ToolTest, AProfileIsAMapToo)
+{
+    LoadSource();
+    Click(kToolLoadMap, "data/PoserBVH.prf");
+    EXPECT_EQ(m_kTool.Map().Lines().size(), 10u);
+    EXPECT_EQ(Marked(), " hip  lThigh  lShin  lFoot  rThigh  rShin  rFoot > LowerTorso  LThigh  LCalf  LFoot "
+                        " RThigh  RCalf  RFoot ");
+}
+
+TEST_F(ToolTest, AMapComesBackAsItWasSaved)
+{
+    LoadSource();
+    LoadMap(kMap);
+    Click(kToolSaveMap, "saved.txt");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.defaultExtension, "txt");
+    EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.txt;||");
+    EXPECT_EQ(Read("saved.txt"), Read("map.txt"));
+    Click(kToolSaveMap, "none/saved.txt");
+    EXPECT_EQ(m_kTool.Status().find("Not saved: saved.txt: "), 0u) << m_kTool.Status();
+}
+
+TEST_F(ToolTest, DeletingKeepsTheSelectionOnTheLinesThatFollow)
+{
+    LoadSource();
+    LoadMap(kMap);
+    Click(kToolDelete);
+    EXPECT_EQ(m_kTool.Map().Lines().size(), 9u) << "nothing is selected";
+    m_kTool.SelectLine(3);
+    Click(kToolDelete);
+    EXPECT_EQ(m_kTool.Map().SelectedLine()->text, "lThigh <---> LThigh 10,20,30");
+    EXPECT_EQ(Marked().find("hip"), std::string::npos);
+    m_kTool.SelectLine(7);
+    Click(kToolDelete);
+    EXPECT_EQ(m_kTool.Map().Selected(), 6) << "the last one";
+    Click(kToolDeleteAll);
+    EXPECT_EQ(Lines(), "");
+    EXPECT_EQ(Marked(), ">");
+}
+
+TEST_F(ToolTest, ASelectedMappingSelectsItsBones)
+{
+    LoadSource();
+    LoadMap(kMap);
+    m_kTool.SelectLine(4);
+    EXPECT_EQ(m_kTool.SourceTree().SelectedText() + '>' + m_kTool.TargetTree().SelectedText(),
+              "lThigh>LThigh");
+    for (const int line : {0, 1, 5, -1, 99})
+    {
+        m_kTool.SelectLine(line);
+        EXPECT_EQ(m_kTool.SourceTree().SelectedText(), "lThigh") << "line " << line << " names no pair";
+    }
+    EXPECT_FALSE(m_kTool.IsEnabled(kToolDetail));
+}
+
+TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
+{
+    const auto setNumbers = [](CMapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
+    const auto setRate = [](CMapLine& line) { line.frameRate = 25; };
+    const auto setText = [](CMapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
+    const struct
+    {
+        const char* what;
+        int line;
+        std::function<void(CMapLine&)> edit;
+        const char* text;
+    } rows[] = {
+        {"a text, cut",      0, setText,    "\u00c4 name of more than thirty-two c"},
+        {"the position",     1, setNumbers, "Position 1,-2,720"                    },
+        {"the frame rate",   2, setRate,    "FrameRate 25"                         },
+        {"a new mapping",    3, setNumbers, "hip <---> LowerTorso 1,-2,720"        },
+        {"a turned mapping", 4, setNumbers, "lThigh <---> LThigh 1,-2,720"         },
+    };
+    LoadSource();
+    LoadMap(kMap);
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        m_kTool.SelectLine(row.line);
+        m_kToolWindow.m_kOnEdit = nullptr;
+        const std::string before = m_kTool.Map().SelectedLine()->text;
+        Click(kToolDetail);
+        EXPECT_EQ(m_kTool.Map().SelectedLine()->text, before) << "cancelled";
+        m_kToolWindow.m_kOnEdit = row.edit;
+        Click(kToolDetail);
+        EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(row.line)].text, row.text);
+        EXPECT_EQ(m_kTool.Map().Selected(), row.line);
+    }
+    EXPECT_EQ(m_kTool.Map().RootPosition(), (Vec3{1, -2, 720}));
+    EXPECT_EQ(m_kTool.Map().FrameRate(), 25);
+}
+
+TEST_F(ToolTest, OtherSkeletonsTakeTheLinesOutThatSayNothingOfThem)
+{
+    LoadSource();
+    LoadMap(kMap);
+    m_kTool.SelectLine(6);
+    LoadSource();
+    EXPECT_EQ(Lines(), "hip <---> LowerTorso .|lThigh <---> LThigh 10,20,30|rThigh <---> RThigh .|"
+                       "lFoot <---> LFoot .|rFoot <---> RFoot .|");
+    EXPECT_EQ(m_kTool.Map().SelectedLine()->text, "rThigh <---> RThigh .");
+    EXPECT_EQ(m_kTool.SourceTree().SelectedText(), "rThigh") << "trees keep their selection";
+    EXPECT_NE(Marked().find("hip"), std::string::npos);
+    EXPECT_EQ(m_kTool.Status(), "walk.bvh: 3 frames; 4 map lines without bones here removed");
+
+    Write("max.bvh", BvhText(kMaxBones));
+    Click(kToolLoadTarget, "max.bvh");
+    EXPECT_EQ(Lines(), "");
+    Add("hip", "Bip01");
+    Click(kToolLoadSource, "max.bvh");
+    EXPECT_EQ(m_kTool.TargetTree().Items().front().m_kText, "LowerTorso") << "the fixed skeleton again";
+    EXPECT_EQ(Lines(), "");
+}
+
+TEST_F(ToolTest, LinesDoWhatTheirPageSays)
+{
+    const std::string page = ReadBytes(GAITWRIGHT_DOCS "/formats/map-lines.md");
+    const size_t begin = page.find("file=tiny.txt\n") + 14;
+    const std::string map = page.substr(begin, page.find("```", begin) - begin);
+    const auto posesOf = [this](const std::string& text) {
+        LoadMap(text);
+        Click(kToolConvert);
+        return ResultPoses();
+    };
+    LoadSource(2);
+    const std::vector<Mat4> plain = posesOf(map);
+    const std::regex row("\\n\\| `([^`]+)` \\| `([^`]+)` \\| (differs|is the same) \\|(?=\\n)");
+    int rowCount = 0;
+    for (std::sregex_iterator it(page.begin(), page.end(), row), end; it != end; ++it, ++rowCount)
+    {
+        SCOPED_TRACE(it->str());
+        const std::string from = it->str(1);
+        ASSERT_NE(map.find(from), map.npos);
+        EXPECT_EQ(posesOf(std::string(map).replace(map.find(from), from.size(), it->str(2))) != plain,
+                  it->str(3) == "differs");
+    }
+    EXPECT_GE(rowCount, 9);
+}
+
+TEST_F(ToolTest, BonesThatAreNotThereHaveNoEffect)
+{
+    LoadSource(2);
+    LoadMap("Position 0,0,0|hip <---> LowerTorso .|");
+    Click(kToolConvert);
+    const std::vector<Mat4> plain = ResultPoses();
+    LoadMap("Position 0,0,0|hip <---> LowerTorso .|a|b|c|* nowhere|*|");
+    int line = 2;
+    for (const char* text : {"a <---> LThigh 1,2,3", "hip <---> b 1,2,3", "<---> "})
+    {
+        m_kTool.SelectLine(line++);
+        m_kToolWindow.m_kOnEdit = [&](CMapLine& edited) { edited.text = text; };
+        Click(kToolDetail);
+    }
+    EXPECT_EQ(Lines(), "Position 0,0,0|hip <---> LowerTorso .|a <---> LThigh 1,2,3|hip <---> b 1,2,3|<---> |"
+                       "* nowhere|*|");
+    Click(kToolConvert);
+    EXPECT_EQ(ResultPoses(), plain);
+}
+
+// What a conversion leaves on the result must not show in the next one.
+
+TEST_F(ToolTest, HostileMaps)
+{
+    std::string everyByte;
+    for (int byte = 0; byte < 256; ++byte)
+        everyByte += static_cast<char>(byte);
+    const struct
+    {
+        const char* what;
+        std::string bytes;
+    } rows[] = {
+        {"nothing",                                      ""                                           },
+        {"empty lines",                                  std::string(1000,                              '\n')},
+        {"one long line",                                              std::string(200'000,                                                                             'x')},
+        {"a long mapping",                                          "hip <---> LowerTorso " + std::string(200'000,           '9')},
+        {"long names",std::string(70'000,'a') + " <---> " + std::string(70'000, 'b')},
+        {"every byte",                                   everyByte + everyByte                                                                                                      },
+        {"zeros",                                          std::string(5000,                                                                                       '\0')},
+        {"no numbers","Position a,b,c\nFrameRate\nhip <---> LowerTorso x,y,z\n"},
+        {"numbers too large","Position 1e99,-1e99,nan\nFrameRate 99999999999\nhip <---> LowerTorso 1e39\n"},
+        {"keywords alone",                                   "Position\n<--->\n*\nFrameRate\n"                                },
+    };
+    LoadSource();
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        Write("hostile.txt", row.bytes);
+        Click(kToolLoadMap, "hostile.txt");
+        m_kToolWindow.m_kOnEdit = [](CMapLine&) {};
+        for (int line = 0; line < 5; ++line)
+        {
+            m_kTool.SelectLine(line);
+            Click(kToolDetail);
+        }
+        Click(kToolConvert);
+        Click(kToolSaveMap, "copy.txt");
+        Click(kToolLoadMap, "copy.txt");
+    }
+    const std::string lines = Lines();
+    Write("hostile.txt", std::string(300'000, 'x'));
+    Click(kToolLoadMap, "hostile.txt");
+    EXPECT_EQ(m_kTool.Status(), "hostile.txt: this cannot be opened, or is longer than any map");
+    EXPECT_EQ(Lines(), lines);
+}
+
+} // namespace gw
