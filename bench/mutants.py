@@ -1,12 +1,12 @@
 #!/usr/bin/env python3
-"""Plants each fault of a list in a copy of the tree and tells which of them no test finds.
+"""Plants each fault of a list in a copy of the tree and prints those that no test finds.
 
     bench/mutants.py [--list bench/mutants.txt] [--copy build/mutants] [--jobs N] [WORD]
 
 A line of the list is: folder | file | text as it is | text with the fault. The text must be in the file exactly once.
-For each line the test program of the folder is built and run until its first failure. A WORD takes only the lines that
-have it. The copy is a git worktree of the present commit with a build of its own, and stays for the next time.
-GAITWRIGHT_TEST_DATA is passed on. Answers 1 when a fault survives.
+For each line, the folder's test program is built and run until its first failure. With a WORD, only lines that contain
+it are used. The copy is a git worktree of the current commit with its own build, and is kept for the next run.
+GAITWRIGHT_TEST_DATA is passed on. The exit code is 1 if a fault survives.
 """
 import argparse
 import os

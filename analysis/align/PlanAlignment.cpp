@@ -39,8 +39,8 @@ void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& d
     }
 }
 
-// Whether a rest pose tells how bones are turned: legs along the trunk, shoulders and feet facing as the hips
-// do. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside the bones' real ends.
+// Whether bone rotations can be measured in a rest pose: the legs continue the trunk, and shoulders and feet
+// face the same way as the hips. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside the bones' real ends.
 bool IsReference(const BodyStance& stance)
 {
     constexpr double kTrunkLimit = 40.0;

@@ -23,8 +23,8 @@ struct BodyPaths
 /// The paths of a body with a hip and both feet; none for one without. Leaves the tree posed.
 BodyPaths FollowBody(const CMotionFile& motion, const CBodyMap& body);
 
-/// The world axis, plus or minus, along which the hip stands over the feet in the whole motion. +Y where
-/// there are no frames.
+/// The world axis, plus or minus, along which the hip is above the feet over the whole motion; +Y for a
+/// motion without frames.
 Vec3 FindUpAxis(const BodyPaths& paths);
 
 /// Thigh and shin in the rest pose, the mean of both legs; 0 where a joint of them is not known.

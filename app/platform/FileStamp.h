@@ -19,7 +19,7 @@ struct FileStamp
     friend bool operator==(const FileStamp&, const FileStamp&) = default;
 };
 
-/// The stamp of a file, with links followed. Null if there is no such file.
+/// Returns the stamp of a file, following links; null if the file does not exist.
 std::optional<FileStamp> StampOf(const std::string& path);
 
 } // namespace gw

@@ -39,8 +39,8 @@ std::string_view BuiltInString(int id);
 /// also shows what the step reported on the way. Questions in the middle of a step do not.
 bool EndsStep(int id);
 
-/// A text with its %d and %s replaced in order. Formats may come from a translation, so whatever else they
-/// hold is copied, and placeholders without an argument become nothing.
+/// Returns a text with its %d and %s replaced in order. Formats may come from a translation: everything else
+/// in them is copied, and a %d or %s without an argument is removed.
 std::string FormatText(std::string_view format, std::span<const std::string> arguments);
 
 } // namespace gw

@@ -43,7 +43,7 @@ public:
         std::string text = {}; ///< of a Text or of Nested
     };
 
-    /// Reads a whole text. After a fault there are no members.
+    /// Reads a whole text. If that fails, no members are kept.
     EJsonFault Read(std::string_view text);
 
     /// False for an array.

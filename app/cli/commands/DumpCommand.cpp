@@ -40,7 +40,7 @@ EExit RunDump(const COptions& options)
     SayWarnings(options, source, file.Record());
     const std::vector<CObject*> roots = file.Roots();
     if (roots.empty())
-        SayWord(options, "warning: " + Printable(source) + ": there are no roots to show");
+        SayWord(options, "warning: " + Printable(source) + ": the file has no roots to show");
     const std::string folder = WithSeparator(options.outputFolder);
     if (!CreateFolder(options.outputFolder))
         return Fail(folder, "the folder cannot be created");

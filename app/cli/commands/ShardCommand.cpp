@@ -46,7 +46,7 @@ bool HasShard(const CRunPlan& plan, int64_t shard)
 {
     if (static_cast<uint64_t>(shard) < plan.shardCount)
         return true;
-    SayError("there is no shard " + std::to_string(shard) + "; the plan has shards 0 to " +
+    SayError("unknown shard " + std::to_string(shard) + "; the plan has shards 0 to " +
              std::to_string(plan.shardCount - 1));
     return false;
 }

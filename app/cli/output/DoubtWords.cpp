@@ -13,12 +13,12 @@ namespace {
 
 constexpr const char* kSurenessNames[] = {"sure", "likely", "doubtful"};
 
-// A name for programs, and the sentence around the joint's name for people.
+// A name for programs, and the sentence that people read, in pieces around the names of joints.
 struct DoubtText
 {
     const char* name;
     const char* before;
-    const char* between; // the joint and another one; null if there is no other
+    const char* between; // between the names of two joints; null if only one is named
     const char* behind;
 };
 

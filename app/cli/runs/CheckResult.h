@@ -18,8 +18,8 @@ MotionClip SourceClipOf(const CShellContent& content);
 /// after the job. The result is saved already: its tracks take the target's rest pose.
 ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job);
 
-/// Measures these by the profile file that made the one of the other. Nothing where it cannot be read any
-/// more or there are no frames.
+/// Compares source and result by the profile that the conversion used. Returns nothing if the profile can no
+/// longer be read or the motion has no frames.
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,
                                                 const std::string& profilePath);
 

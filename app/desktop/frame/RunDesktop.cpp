@@ -28,10 +28,9 @@ namespace {
 constexpr const char* kSkinFolder = "Content";
 constexpr const char* kTargetFile = "base.htr";
 
-constexpr const char* kUsage =
-    "Usage: GaitForge [FILE]\n"
-    "       GaitForge -s                        the map tool\n"
-    "       GaitForge --reset-instance-counter  clear the lock after a crash\n";
+constexpr const char* kUsage = "Usage: GaitForge [FILE]\n"
+                               "       GaitForge -s                        the map tool\n"
+                               "       GaitForge --reset-instance-counter  clear the lock after a crash\n";
 
 constexpr const char* kBlocked =
     "GaitForge: another instance seems to be running, but it does not respond. If it crashed, run:\n"
@@ -168,9 +167,7 @@ int RunDesktop(int argc, char** argv)
         return *code;
     if (!HasDisplay())
     {
-        std::fputs(
-            "GaitForge: there is no display for a window; the program \"gaitwright\" does not need one\n",
-            stderr);
+        std::fputs("GaitForge: no display was found; \"gaitwright\" works without one\n", stderr);
         return EXIT_FAILURE;
     }
     RequestPreviewFormat();
