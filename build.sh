@@ -9,7 +9,7 @@
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
 #   ./build.sh package      makes Debian packages in build/release/packages and tries them
 #   ./build.sh cluster-test runs the lines of docs/clusters.md with Slurm and GNU parallel on this machine
-#   ./build.sh lint         checks formatting and runs the linter
+#   ./build.sh lint [REVISION]  checks formatting and runs the linter, on what has changed since a revision or on all
 set -euo pipefail
 cd "$(dirname "$0")"
 
@@ -101,6 +101,22 @@ fuzz() {
   return $failed
 }
 
+# sources_to_lint [REVISION]: all sources, or those that are changed, or whose header is, since a revision.
+sources_to_lint() {
+  if [ -z "${1:-}" ]; then
+    git ls-files '*.cpp'
+  else
+    git diff --name-only "$1" -- '*.cpp' '*.h' | sed 's/\.h$/.cpp/' | sort -u | xargs -r git ls-files
+  fi | grep -v '^bench/load_baseline' || true
+}
+
+# Each source is checked by itself: the linter reads the commands of the preset that joins none.
+lint() {
+  git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
+  cmake --preset dev >/dev/null
+  sources_to_lint "${1:-}" | xargs -r -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
+}
+
 case "${1:-}" in
 build)
   prepare
@@ -148,9 +164,7 @@ cluster-test)
   ;;
 lint)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
-  git ls-files '*.cpp' '*.h' | xargs clang-format --dry-run --Werror
-  [ -f build/dev/build.ninja ] || cmake --preset dev >/dev/null
-  git ls-files '*.cpp' | grep -v '^bench/load_baseline' | xargs -P "$(nproc)" -n 4 clang-tidy -p build/dev --quiet
+  lint "${2:-}"
   ;;
 *)
   sed -n '4,13s/^# *//p' "$0"

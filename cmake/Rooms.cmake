@@ -57,7 +57,7 @@ function(gw_room name)
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
   target_link_libraries(${name} PUBLIC ${ROOM_PUBLIC} PRIVATE ${ROOM_PRIVATE})
   target_compile_features(${name} PUBLIC cxx_std_20)
-  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON UNITY_BUILD ${GAITWRIGHT_UNITY} UNITY_BUILD_BATCH_SIZE 8)
   gw_compile_options(${name})
 endfunction()
 

@@ -32,6 +32,8 @@ BodyStance StanceIn(const CJointTree& tree, size_t stance, const CBodyMap& body)
 /// where the knees bend to. A mean over all poses that say something; below 0 the second leg is the left one.
 /// 0 where none says anything.
 double JudgeSides(const CJointTree& tree, const LegsOfBody& body);
+/// From here on, either way, a verdict of JudgeSides or JudgeAlong is sure.
+inline constexpr double kSidesSure = 0.3;
 
 /// The same for a pair of joints that should lie to the same sides as the thighs.
 double JudgeAlong(const CJointTree& tree, const LegsOfBody& body, int first, int second);

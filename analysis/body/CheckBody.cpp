@@ -13,7 +13,6 @@ namespace gw {
 
 namespace {
 
-constexpr double kSidesSure = 0.3;    // of JudgeSides and JudgeAlong
 constexpr double kBetterChoice = 0.4; // by how much another choice must suit a limb better
 constexpr double kUneven = 1.5;       // left bone by right bone
 

@@ -13,8 +13,6 @@ namespace gw {
 
 namespace {
 
-constexpr double kSidesSure = 0.3; // of JudgeSides
-
 // A pair of chains as arms or legs.
 struct Limbs
 {

@@ -24,8 +24,8 @@ struct Norms
     double behindWeight;
     double spread; // half the way between both sides' upper bones, of both bones
 };
-constexpr Norms kArm{0.12, 0.60, 1.5, 0.45, 2.5, 0.34};
-constexpr Norms kLeg{0.04, 0.20, 1.5, 0.40, 2.5, 0.12};
+constexpr Norms kArmNorms{0.12, 0.60, 1.5, 0.45, 2.5, 0.34};
+constexpr Norms kLegNorms{0.04, 0.20, 1.5, 0.40, 2.5, 0.12};
 constexpr double kSpreadWeight = 0.4;
 constexpr double kMostOfSpread = 0.6;
 constexpr double kMostOfOnePart = 1.5;
@@ -37,7 +37,7 @@ constexpr double kAsLongBranch = 0.6; // of the longest; twist joints beside a b
 
 const Norms& NormsOf(ELimb limb)
 {
-    return limb == ELimb::Arm ? kArm : kLeg;
+    return limb == ELimb::Arm ? kArmNorms : kLegNorms;
 }
 
 double Capped(double cost)

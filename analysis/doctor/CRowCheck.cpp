@@ -18,14 +18,6 @@ namespace {
 
 constexpr size_t kLongestGap = 3; // frames without a number that may be made up from those beside them
 
-size_t CountTokens(std::string_view text)
-{
-    size_t count = 0;
-    while (!NextToken(text).empty())
-        ++count;
-    return count;
-}
-
 bool IsSeparator(char c)
 {
     return kTokenDelimiters.find(c) != kTokenDelimiters.npos;

@@ -15,14 +15,6 @@ namespace {
 
 constexpr size_t kWriteBytes = size_t{1} << 20;
 
-size_t CountTokens(std::string_view text)
-{
-    size_t count = 0;
-    while (!NextToken(text).empty())
-        ++count;
-    return count;
-}
-
 } // namespace
 
 bool CRowMender::Write(std::string_view text, CSafeFile& file)

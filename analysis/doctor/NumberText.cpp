@@ -23,6 +23,8 @@ bool StandsBetweenDigits(std::string_view text, size_t at)
     return at > 0 && at + 1 < text.size() && IsDigit(text[at - 1]) && IsDigit(text[at + 1]);
 }
 
+} // namespace
+
 size_t CountTokens(std::string_view text, std::string_view delimiters)
 {
     size_t count = 0;
@@ -30,8 +32,6 @@ size_t CountTokens(std::string_view text, std::string_view delimiters)
         ++count;
     return count;
 }
-
-} // namespace
 
 bool HasDecimalCommas(std::string_view text, size_t valueCount)
 {

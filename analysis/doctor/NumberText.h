@@ -1,6 +1,7 @@
 #pragma once
 
 #include "Fault.h"
+#include "Text.h"
 
 #include <cstddef>
 #include <optional>
@@ -8,6 +9,9 @@
 #include <string_view>
 
 namespace gw {
+
+/// The number of tokens in a text.
+size_t CountTokens(std::string_view text, std::string_view delimiters = kTokenDelimiters);
 
 /// Whether the commas of a text are decimal commas without doubt: each stands between two digits, and without
 /// them as separators the text holds the number of values that it must, with them more.

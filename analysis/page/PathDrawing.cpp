@@ -13,11 +13,11 @@ namespace gw {
 
 namespace {
 
-constexpr double kWidth = 300.0;
-constexpr double kHeight = 130.0;
+constexpr double kPathWidth = 300.0;
+constexpr double kPathHeight = 130.0;
 constexpr double kLeastExtent = 100.0; // mm: who stands still sways, and this is no walk
 
-struct Range
+struct PathRange
 {
     double least = std::numeric_limits<double>::infinity();
     double largest = -std::numeric_limits<double>::infinity();
@@ -36,8 +36,8 @@ struct Range
 // Where the ground lies in the drawing.
 struct Ground
 {
-    Range x;
-    Range z;
+    PathRange x;
+    PathRange z;
     double scale = 0.0; // drawing to mm
 
     explicit Ground(std::initializer_list<const std::vector<Vec3>*> ways)
@@ -50,16 +50,16 @@ struct Ground
                 z.Add(place.z);
             }
         }
-        scale = std::min(kWidth / std::max(x.Extent(), kLeastExtent),
-                         kHeight / std::max(z.Extent(), kLeastExtent));
+        scale = std::min(kPathWidth / std::max(x.Extent(), kLeastExtent),
+                         kPathHeight / std::max(z.Extent(), kLeastExtent));
     }
     double X(const Vec3& place) const
     {
-        return (static_cast<double>(place.x) - x.Middle()) * scale + 0.5 * kWidth;
+        return (static_cast<double>(place.x) - x.Middle()) * scale + 0.5 * kPathWidth;
     }
     double Y(const Vec3& place) const
     {
-        return (static_cast<double>(place.z) - z.Middle()) * scale + 0.5 * kHeight;
+        return (static_cast<double>(place.z) - z.Middle()) * scale + 0.5 * kPathHeight;
     }
 };
 
@@ -83,10 +83,10 @@ void AppendWay(CMarkup& page, const Ground& ground, const std::vector<Vec3>& way
 // A line of a round length at the bottom, and how long it is.
 void AppendScale(CMarkup& page, const Ground& ground)
 {
-    const std::vector<double> ticks = CAxis(0.0, kWidth / ground.scale, 5).Ticks();
-    page.Raw("<path class=\"scale\" d=\"M4 ").Number(kHeight + 8.0, 0).Raw("h");
+    const std::vector<double> ticks = CAxis(0.0, kPathWidth / ground.scale, 5).Ticks();
+    page.Raw("<path class=\"scale\" d=\"M4 ").Number(kPathHeight + 8.0, 0).Raw("h");
     page.Number(ticks[1] * ground.scale, 1).Raw("\"/><text x=\"").Number(ticks[1] * ground.scale + 9.0, 1);
-    page.Raw("\" y=\"").Number(kHeight + 11.0, 0).Raw("\">").Number(ticks[1], 0).Raw(" mm</text>");
+    page.Raw("\" y=\"").Number(kPathHeight + 11.0, 0).Raw("\">").Number(ticks[1], 0).Raw(" mm</text>");
 }
 
 } // namespace

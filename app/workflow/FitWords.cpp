@@ -9,12 +9,6 @@ namespace gw {
 
 namespace {
 
-std::string Quoted(std::string_view name)
-{
-    std::string text = "\"";
-    return text.append(Printable(name)).append("\"");
-}
-
 std::string MissingLine(const CMissingBone& missing)
 {
     const std::string place = missing.line == 0 ? "" : "line " + std::to_string(missing.line) + ": ";

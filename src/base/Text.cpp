@@ -183,6 +183,11 @@ std::string Printable(std::string_view text)
     return out;
 }
 
+std::string Quoted(std::string_view name)
+{
+    return '"' + Printable(name) + '"';
+}
+
 std::string NearestName(std::string_view name, const std::vector<std::string>& candidates)
 {
     // The distance takes time by the product of the lengths, and a name comes from a file.

@@ -29,6 +29,8 @@ std::string_view SkipByteOrderMark(std::string_view text);
 /// A text as it may be printed: control characters as \xNN, so that a name in a file cannot command a
 /// terminal.
 std::string Printable(std::string_view text);
+/// A name from a file in double quotes, as Printable shows it.
+std::string Quoted(std::string_view name);
 /// The candidate nearest to a name by edit distance without regard to case, or empty when none is near.
 std::string NearestName(std::string_view name, const std::vector<std::string>& candidates);
 

@@ -7,7 +7,6 @@ namespace gw {
 
 namespace {
 
-constexpr uint32_t kOpaque = 255;
 constexpr int32_t kBlitFormats = 2;
 
 // The bytes of a pixel in the formats that can be drawn.

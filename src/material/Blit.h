@@ -4,6 +4,9 @@
 
 namespace gw {
 
+/// An opacity, or a byte of alpha, that lets nothing through.
+inline constexpr uint8_t kOpaque = 255;
+
 /// Draws a part of a picture on another one, cut to both. Opacity goes from 0, which changes nothing, to 255,
 /// which copies; between them every byte of a pixel is mixed. Pixels without alpha count as opaque. False for
 /// formats other than 0 and 1, and where pixels cannot be mapped.

@@ -11,7 +11,6 @@ const CRTTI CAnmImageControl::ms_kRTTI{"CAnmImageControl", &CControl::ms_kRTTI};
 
 namespace {
 
-constexpr uint8_t kOpaque = 255;
 constexpr float kDelayUnit = 10.0f; // hundredths of a second in thousandths
 
 // When each frame begins. A frame waits for its own delay, not for that of the one before it.

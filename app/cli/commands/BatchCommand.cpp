@@ -96,7 +96,7 @@ bool ListJobs(const COptions& options, CFileRun::Jobs& jobs)
     return true;
 }
 
-EExit Refuse(const std::string& words)
+EExit FailWith(const std::string& words)
 {
     SayError(words);
     return EExit::Failed;
@@ -107,7 +107,7 @@ EExit Refuse(const std::string& words)
 EExit RunBatchFolder(const COptions& options)
 {
     if (!options.files.empty() && !FolderExists(options.files[0]))
-        return Refuse(Printable(options.files[0]) + ": no such folder");
+        return FailWith(Printable(options.files[0]) + ": no such folder");
     if (!IsRunPossible(options))
         return EExit::Usage;
     if (!options.files.empty() && !CanListFolder(options, options.files[0]))
@@ -118,8 +118,9 @@ EExit RunBatchFolder(const COptions& options)
     if (!AreOutputsApart(jobs))
         return EExit::Usage;
     if (jobs.empty())
-        return Refuse(Printable(options.files.empty() ? options.filesFrom : options.files[0]) +
-                      ": the folder contains no " + std::string(BatchSource(BatchJobOf(options))) + " file");
+        return FailWith(Printable(options.files.empty() ? options.filesFrom : options.files[0]) +
+                        ": the folder contains no " + std::string(BatchSource(BatchJobOf(options))) +
+                        " file");
     if (!MakeOutputFolder(options))
         return EExit::Failed;
     return RunBatchJobs(options, jobs);

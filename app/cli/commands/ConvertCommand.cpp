@@ -16,12 +16,6 @@ namespace gw {
 
 namespace {
 
-bool Refuse(const std::string& words)
-{
-    SayError(words);
-    return false;
-}
-
 // The file that will be written for a name: a name without an extension gets the save dialog's, and an .htr
 // is written in small letters.
 bool ResolveOutput(std::string& output)
@@ -88,7 +82,8 @@ bool IsManyPossible(const COptions& options)
     if (options.outputFolder.empty())
         return Refuse("several sources, or a folder, need --out-dir DIR");
     if (!options.output.empty())
-        return Refuse("-o names a single file and cannot be combined with --out-dir, which names results after their sources");
+        return Refuse("-o names a single file and cannot be combined with --out-dir, which names results "
+                      "after their sources");
     return true;
 }
 

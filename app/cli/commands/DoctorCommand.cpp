@@ -130,12 +130,6 @@ EExit ExamineFile(const COptions& options, const std::string& path)
     return exam.Findings().HasFaults() ? EExit::Failed : EExit::Done;
 }
 
-bool Refuse(const std::string& words)
-{
-    SayError(words);
-    return false;
-}
-
 bool CanFix(const COptions& options)
 {
     if (options.files.size() != 1)

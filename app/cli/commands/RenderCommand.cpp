@@ -20,12 +20,6 @@ namespace gw {
 
 namespace {
 
-bool Refuse(const std::string& words)
-{
-    SayError(words);
-    return false;
-}
-
 PictureMotion Shown(CNode* root, const SourceTiming& timing)
 {
     return {Ref<CNode>(root), timing.FrameStep(), timing.lastFrame};

@@ -84,7 +84,7 @@ std::string ValueCases()
     return text;
 }
 
-std::string OptionNames(const CCommand& command)
+std::string OptionWords(const CCommand& command)
 {
     std::string text;
     for (const COptionRow& row : OptionTable())
@@ -96,12 +96,12 @@ std::string CommandCases()
 {
     std::string text;
     for (const CCommand& command : Commands())
-        text += "    " + std::string(command.name) + ")\n        options='" + OptionNames(command) +
+        text += "    " + std::string(command.name) + ")\n        options='" + OptionWords(command) +
                 "'\n        [[ $word == -* ]] || " + OfferCall(AnyOperandOf(command)) + "\n        ;;\n";
     return text;
 }
 
-std::string CommandNames()
+std::string CommandWords()
 {
     std::string text;
     for (const CCommand& command : Commands())
@@ -114,7 +114,7 @@ std::string CommandNames()
 std::string BashCompletion()
 {
     return std::string(kFunctions) + "    if ((COMP_CWORD == 1)); then\n        _gaitwright_words " +
-           CommandNames() + "-h --help --version\n        return\n    fi\n    case $before in\n" +
+           CommandWords() + "-h --help --version\n        return\n    fi\n    case $before in\n" +
            ValueCases() + "    esac\n    case ${COMP_WORDS[1]} in\n" + CommandCases() +
            "    esac\n    # shellcheck disable=SC2086\n    [[ $word != -* ]] || _gaitwright_words "
            "$options\n}\n\ncomplete -F _gaitwright gaitwright\n";

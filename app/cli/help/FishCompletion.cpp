@@ -5,7 +5,7 @@ namespace gw {
 
 namespace {
 
-constexpr std::string_view kHead =
+constexpr std::string_view kFishHead =
     R"fish(# fish completion for gaitwright, written by 'gaitwright --completion fish'
 
 complete -c gaitwright -f
@@ -16,7 +16,7 @@ complete -c gaitwright -n __fish_use_subcommand -l version -d 'of the program'
 constexpr std::string_view kProfiles =
     R"fish( -r -F -a "(gaitwright profiles 2>/dev/null | string replace -r ' \((stock|own), .*' '')")fish";
 
-std::string Quoted(std::string_view text)
+std::string FishQuoted(std::string_view text)
 {
     std::string quoted = "'";
     for (const char c : text)
@@ -37,7 +37,7 @@ std::string Offer(const CompletedWord& word)
     case EOffer::Any:
         return " -x";
     case EOffer::Choices:
-        return " -x -a " + Quoted(Joined(word.words, " "));
+        return " -x -a " + FishQuoted(Joined(word.words, " "));
     case EOffer::Folders:
         return " -x -a '(__fish_complete_directories)'";
     case EOffer::Profiles:
@@ -64,7 +64,7 @@ std::string OptionLine(const COptionRow& row)
         const bool isLong = name.starts_with("--");
         names += std::string(isLong ? " -l " : " -s ") + std::string(name.substr(isLong ? 2 : 1));
     }
-    return Line(commands) + names + Offer(ValueOf(row)) + " -d " + Quoted(row.help) + '\n';
+    return Line(commands) + names + Offer(ValueOf(row)) + " -d " + FishQuoted(row.help) + '\n';
 }
 
 std::string CommandLines(const CCommand& command)
@@ -72,7 +72,7 @@ std::string CommandLines(const CCommand& command)
     const std::string name(command.name);
     const bool takesFolder = AnyOperandOf(command).offer == EOffer::Folders;
     return "complete -c gaitwright -n __fish_use_subcommand -a " + name + " -d " +
-           Quoted(command.help.substr(0, command.help.find('\n'))) + '\n' + Line(' ' + name) +
+           FishQuoted(command.help.substr(0, command.help.find('\n'))) + '\n' + Line(' ' + name) +
            (takesFolder ? " -a '(__fish_complete_directories)'" : " -F") + '\n';
 }
 
@@ -80,7 +80,7 @@ std::string CommandLines(const CCommand& command)
 
 std::string FishCompletion()
 {
-    std::string text(kHead);
+    std::string text(kFishHead);
     for (const CCommand& command : Commands())
         text += CommandLines(command);
     for (const COptionRow& row : OptionTable())

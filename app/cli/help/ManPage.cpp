@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-constexpr std::string_view kHead =
+constexpr std::string_view kManHead =
     ".TH GAITWRIGHT 1 \"\" \"gaitwright " GAITWRIGHT_VERSION "\" \"User Commands\"\n"
     ".SH NAME\n"
     "gaitwright \\- convert motion capture to one fixed skeleton\n"
@@ -102,7 +102,7 @@ std::string CommandEntry(const CCommand& command)
 
 std::string ManPage()
 {
-    std::string page(kHead);
+    std::string page(kManHead);
     page += ".SH OPTIONS\nFor every command:\n" + OptionEntries(SharedOptions()) +
             OptionEntry("-h,--help", {}, "show the help of a command") +
             OptionEntry("--version", {}, "show the version; used without a command") + ".SH COMMANDS\n";

@@ -5,7 +5,7 @@ namespace gw {
 
 namespace {
 
-constexpr std::string_view kHead = R"zsh(#compdef gaitwright
+constexpr std::string_view kZshHead = R"zsh(#compdef gaitwright
 # zsh completion for gaitwright, written by 'gaitwright --completion zsh'
 
 _gaitwright_profiles() {
@@ -20,7 +20,7 @@ _gaitwright() {
 )zsh";
 
 // A text within single quotes, in the brackets of a word of _arguments.
-std::string Quoted(std::string_view text)
+std::string ZshQuoted(std::string_view text)
 {
     std::string quoted;
     for (const char c : text)
@@ -35,7 +35,7 @@ std::string Quoted(std::string_view text)
 // ":SOURCE:_files ..."
 std::string Action(const CompletedWord& word)
 {
-    const std::string message = ':' + Quoted(word.name) + ':';
+    const std::string message = ':' + ZshQuoted(word.name) + ':';
     switch (word.offer)
     {
     case EOffer::Nothing:
@@ -59,7 +59,7 @@ std::string Action(const CompletedWord& word)
 std::string OptionWord(const COptionRow& row)
 {
     const std::vector<std::string_view> names = Parts(row.names, ",");
-    const std::string rest = '[' + Quoted(row.help) + ']' + Action(ValueOf(row)) + '\'';
+    const std::string rest = '[' + ZshQuoted(row.help) + ']' + Action(ValueOf(row)) + '\'';
     if (names.size() == 1)
         return '\'' + std::string(names[0]) + rest;
     return "'(" + Joined(names, " ") + ")'{" + std::string(row.names) + "}'" + rest;
@@ -95,10 +95,10 @@ std::string ZshCompletion()
     for (const CCommand& command : Commands())
     {
         const std::string_view help = command.help.substr(0, command.help.find('\n'));
-        names += "        '" + std::string(command.name) + ':' + Quoted(help) + "'\n";
+        names += "        '" + std::string(command.name) + ':' + ZshQuoted(help) + "'\n";
         cases += CommandCase(command);
     }
-    return std::string(kHead) + "    commands=(\n" + names +
+    return std::string(kZshHead) + "    commands=(\n" + names +
            "    )\n    if ((CURRENT == 2)); then\n        _describe command commands\n        return\n    "
            "fi\n"
            "    shift words\n    ((CURRENT--))\n    case $words[1] in\n" +

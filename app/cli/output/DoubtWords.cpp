@@ -3,6 +3,7 @@
 #include "CJsonWriter.h"
 #include "CReport.h"
 #include "ChooseProfile.h"
+#include "Text.h"
 #include "Words.h"
 
 #include <algorithm>
@@ -24,19 +25,19 @@ struct DoubtText
 
 // In the order of EBodyDoubt.
 constexpr DoubtText kPlaceTexts[] = {
-    {"not-below",       "",                            nullptr, " is not below the expected parent joint" },
-    {"sides-swapped",   "",                            nullptr, " is on the other side: left and right are swapped"},
-    {"clavicle-is-arm", "",                            nullptr, " is one joint too far out for an upper arm"},
-    {"arm-is-clavicle", "",                            nullptr, " is too short for an upper arm and looks like a clavicle"},
-    {"legs-up",         "",                            nullptr, " points up like the trunk, so it is not a leg"},
-    {"odd-length",      "the bone lengths in the limb of ", nullptr, " look wrong"                                           },
+    {"not-below",       "",                                 nullptr, " is not below the expected parent joint"                 },
+    {"sides-swapped",   "",                                 nullptr, " is on the other side: left and right are swapped"       },
+    {"clavicle-is-arm", "",                                 nullptr, " is one joint too far out for an upper arm"              },
+    {"arm-is-clavicle", "",                                 nullptr, " is too short for an upper arm and looks like a clavicle"},
+    {"legs-up",         "",                                 nullptr, " points up like the trunk, so it is not a leg"           },
+    {"odd-length",      "the bone lengths in the limb of ", nullptr, " look wrong"                                             },
 };
 
 // In the order of EProfileDoubt, after the first one.
 constexpr DoubtText kTexts[] = {
-    {"other-name", "it uses ",                " although ", " is the joint by name"},
-    {"spine-cut",  "the spine continues above ", " up to ", ""                         },
-    {"turned",     "",                         nullptr,   " ends up rotated sideways" },
+    {"other-name", "it uses ",                   " although ", " is the joint by name"    },
+    {"spine-cut",  "the spine continues above ", " up to ",    ""                         },
+    {"turned",     "",                           nullptr,      " ends up rotated sideways"},
 };
 
 const DoubtText& TextOf(const ProfileDoubt& doubt)

@@ -5,6 +5,7 @@
 #include "CJsonWriter.h"
 #include "COrrinStream.h"
 #include "PackageBlocks.h"
+#include "Text.h"
 #include "Words.h"
 
 #include <algorithm>

@@ -17,6 +17,12 @@ void SayError(std::string_view words)
     std::fwrite(line.data(), 1, line.size(), stderr);
 }
 
+bool Refuse(std::string_view words)
+{
+    SayError(words);
+    return false;
+}
+
 void SayWord(const COptions& options, std::string_view words)
 {
     if (!options.quiet)
@@ -55,11 +61,6 @@ void SayDamage(const std::string& path, const CFailure& failure)
 {
     const std::string place = failure.where == 0 ? "" : " at byte " + std::to_string(failure.where);
     SayError(Printable(path) + ": damaged" + place + ": " + MakeReport(path, failure, false).words);
-}
-
-std::string Quoted(std::string_view name)
-{
-    return '"' + Printable(name) + '"';
 }
 
 } // namespace gw

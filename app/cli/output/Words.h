@@ -12,6 +12,8 @@ struct CReport;
 
 /// A line on standard error under the program's name. Names from files must be printable already.
 void SayError(std::string_view words);
+/// The same for a command line that cannot be carried out; false, for its check to return.
+bool Refuse(std::string_view words);
 /// The same for what is good to know and no failure; silent with --quiet.
 void SayWord(const COptions& options, std::string_view words);
 /// A failure always, a warning unless --quiet.
@@ -25,8 +27,5 @@ void SayWarnings(const COptions& options, const std::string& path, const CFailur
 
 /// What stopped the reading of a container: "scene.orn: damaged at byte 381: ...".
 void SayDamage(const std::string& path, const CFailure& failure);
-
-/// A name from a file in quotes, safe to print.
-std::string Quoted(std::string_view name);
 
 } // namespace gw

@@ -12,8 +12,8 @@ namespace gw {
 
 namespace {
 
-constexpr int kMargin = 24;
-constexpr int kGap = 8;
+constexpr int kAboutMargin = 24;
+constexpr int kAboutGap = 8;
 
 } // namespace
 
@@ -31,8 +31,8 @@ void ShowAboutBox(QWidget& owner)
     buttons->setObjectName(QStringLiteral("buttons"));
     QObject::connect(buttons, &QDialogButtonBox::accepted, &box, &QDialog::accept);
     auto* const layout = new QVBoxLayout(&box);
-    layout->setContentsMargins(kMargin, kMargin, kMargin, kMargin);
-    layout->setSpacing(kGap);
+    layout->setContentsMargins(kAboutMargin, kAboutMargin, kAboutMargin, kAboutMargin);
+    layout->setSpacing(kAboutGap);
     layout->addWidget(name);
     layout->addWidget(version);
     layout->addWidget(buttons);

@@ -31,21 +31,21 @@ struct Template
 
 constexpr Template kTemplates[] = {
     {EMapLine::Mapping,   158, QT_TRANSLATE_NOOP("GaitTool", "Rotation"),
-     QT_TRANSLATE_NOOP("GaitTool", "Degrees around each axis")},
+     QT_TRANSLATE_NOOP("GaitTool", "Degrees around each axis")  },
     {EMapLine::Position,  159, QT_TRANSLATE_NOOP("GaitTool", "Position"),
      QT_TRANSLATE_NOOP("GaitTool", "Start position of the root")},
     {EMapLine::FrameRate, 160, QT_TRANSLATE_NOOP("GaitTool", "Frame Rate"),
-     QT_TRANSLATE_NOOP("GaitTool", "Frames per second")      },
+     QT_TRANSLATE_NOOP("GaitTool", "Frames per second")         },
     {EMapLine::Fixed,     161, QT_TRANSLATE_NOOP("GaitTool", "Name"),
-     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")},
+     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")          },
     {EMapLine::Text,      161, QT_TRANSLATE_NOOP("GaitTool", "Name"),
-     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")},
+     QT_TRANSLATE_NOOP("GaitTool", "Text of the line")          },
 };
 
 constexpr const char* kAxisNames[] = {"X", "Y", "Z"};
 constexpr float Vec3::*kAxes[] = {&Vec3::x, &Vec3::y, &Vec3::z};
 
-QString Translated(const char* text)
+QString LineText(const char* text)
 {
     return QCoreApplication::translate("GaitTool", text);
 }
@@ -57,8 +57,8 @@ CMapLineDialog::CMapLineDialog(const CMapLine& line, QWidget* owner) : QDialog(o
     setLocale(QLocale::c());
     const auto* const made = std::ranges::find(kTemplates, line.kind, &Template::m_eKind);
     setObjectName(QString::number(made->m_iID));
-    setWindowTitle(Translated(made->m_pcTitle));
-    auto* const what = new QLabel(Translated(made->m_pcWhat), this);
+    setWindowTitle(LineText(made->m_pcTitle));
+    auto* const what = new QLabel(LineText(made->m_pcWhat), this);
     what->setObjectName(QStringLiteral("what"));
     what->setProperty("kind", QStringLiteral("caption"));
     auto* const form = new QFormLayout(this);

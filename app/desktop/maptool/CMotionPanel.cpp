@@ -20,7 +20,7 @@ namespace {
 
 constexpr const char* kContext = "GaitTool";
 constexpr int kPictureSide = 200;
-constexpr int kGap = 6;
+constexpr int kPanelGap = 6;
 
 // By EToolMotion.
 constexpr const char* kCaptions[] = {
@@ -37,11 +37,11 @@ struct TransportButton
 
 // In the order of kTransportIds.
 constexpr TransportButton kTransportButtons[] = {
-    {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "First frame")       },
-    {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "Previous frame")    },
-    {EButtonIcon::Stop,        QT_TRANSLATE_NOOP("GaitTool", "Stop")              },
-    {EButtonIcon::Play,        QT_TRANSLATE_NOOP("GaitTool", "Play")              },
-    {EButtonIcon::StepForward, QT_TRANSLATE_NOOP("GaitTool", "Next frame")        },
+    {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "First frame")   },
+    {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "Previous frame")},
+    {EButtonIcon::Stop,        QT_TRANSLATE_NOOP("GaitTool", "Stop")          },
+    {EButtonIcon::Play,        QT_TRANSLATE_NOOP("GaitTool", "Play")          },
+    {EButtonIcon::StepForward, QT_TRANSLATE_NOOP("GaitTool", "Next frame")    },
 };
 
 QString CaptionOf(EToolMotion motion)
@@ -70,7 +70,7 @@ CMotionPanel::CMotionPanel(EToolMotion motion, const CLeftKeys& keys, QWidget* p
     setAccessibleName(CaptionOf(motion));
     auto* const layout = new QVBoxLayout(this);
     layout->setContentsMargins(0, 0, 0, 0);
-    layout->setSpacing(kGap);
+    layout->setSpacing(kPanelGap);
     layout->addLayout(MakeCaption());
     layout->addWidget(MakePicture(keys), 1);
     layout->addLayout(MakeTransport());
@@ -114,7 +114,7 @@ QWidget* CMotionPanel::MakePicture(const CLeftKeys& keys)
 QLayout* CMotionPanel::MakeTransport()
 {
     auto* const row = new QHBoxLayout;
-    row->setSpacing(kGap);
+    row->setSpacing(kPanelGap);
     row->addStretch();
     const int* id = kTransportIds[static_cast<size_t>(m_eMotion)];
     for (const auto& [icon, name] : kTransportButtons)

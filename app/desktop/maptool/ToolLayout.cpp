@@ -56,7 +56,7 @@ constexpr ButtonText kButtonTexts[] = {
     {kToolClose,      QT_TRANSLATE_NOOP("GaitTool", "Close")               },
 };
 
-QString Translated(const char* text)
+QString ToolText(const char* text)
 {
     return QCoreApplication::translate("GaitTool", text);
 }
@@ -86,7 +86,7 @@ void CGaitToolWindow::MakeMenu()
 {
     m_pkMenu = new QMenu(this);
     m_pkMenu->setObjectName(QStringLiteral("windowMenu"));
-    m_pkMenu->addAction(Translated("Close"), this, [this] { Click(kToolClose); });
+    m_pkMenu->addAction(ToolText("Close"), this, [this] { Click(kToolClose); });
     m_pkMenu->addSeparator();
     m_pkMenu->addAction(ToQString(BuiltInString(kAboutToolMessage)), this, [this] { ShowAboutBox(*this); });
 }
@@ -94,11 +94,11 @@ void CGaitToolWindow::MakeMenu()
 void CGaitToolWindow::MakeTop(QGridLayout& grid)
 {
     auto* const hint =
-        new QLabel(Translated("Select a bone in each tree and add the pair to the map. Then convert."), this);
+        new QLabel(ToolText("Select a bone in each tree and add the pair to the map. Then convert."), this);
     hint->setObjectName(QStringLiteral("hint"));
     hint->setProperty("kind", QStringLiteral("caption"));
     grid.addWidget(hint, kTopRow, 0, 1, kColumns - 1);
-    auto* const menu = new CIconButton(EButtonIcon::Menu, Translated("Window menu"), this);
+    auto* const menu = new CIconButton(EButtonIcon::Menu, ToolText("Window menu"), this);
     menu->setObjectName(QStringLiteral("menuButton"));
     connect(menu, &QPushButton::clicked, this, [this, menu] {
         // Right edges in line, so that it stays above the window.
@@ -132,12 +132,12 @@ void CGaitToolWindow::MakeTrees(QGridLayout& grid)
     grid.addLayout(MakeButtons({kToolLoadTarget}), kFileRow, 1);
     m_pkSourceTree = new CBoneTreeView(this);
     m_pkSourceTree->setObjectName(QStringLiteral("sourceTree"));
-    m_pkSourceTree->setAccessibleName(Translated("Source bones"));
+    m_pkSourceTree->setAccessibleName(ToolText("Source bones"));
     m_pkSourceTree->SetOnSelect([this](int item) { Forward([&] { m_kTool.SelectSourceItem(item); }); });
     grid.addWidget(m_pkSourceTree, kTreeRow, 0);
     m_pkTargetTree = new CBoneTreeView(this);
     m_pkTargetTree->setObjectName(QStringLiteral("targetTree"));
-    m_pkTargetTree->setAccessibleName(Translated("Target bones"));
+    m_pkTargetTree->setAccessibleName(ToolText("Target bones"));
     m_pkTargetTree->SetOnSelect([this](int item) { Forward([&] { m_kTool.SelectTargetItem(item); }); });
     grid.addWidget(m_pkTargetTree, kTreeRow, 1);
     grid.addLayout(MakeButtons({kToolAddToMap}), kEditRow, 0, 1, 2);
@@ -148,7 +148,7 @@ void CGaitToolWindow::MakeLines(QGridLayout& grid)
     grid.addLayout(MakeButtons({kToolLoadMap, kToolSaveMap}), kFileRow, kColumns - 1);
     m_pkLines = new QListView(this);
     m_pkLines->setObjectName(QString::number(kToolLines));
-    m_pkLines->setAccessibleName(Translated("Map lines"));
+    m_pkLines->setAccessibleName(ToolText("Map lines"));
     m_pkLines->setModel(&m_kLineTexts);
     m_pkLines->setEditTriggers(QAbstractItemView::NoEditTriggers);
     m_pkLines->setUniformItemSizes(true);
@@ -168,7 +168,7 @@ void CGaitToolWindow::MakeStatus(QGridLayout& grid)
 {
     m_pkStatus = new QLabel(this);
     m_pkStatus->setObjectName(QStringLiteral("status"));
-    m_pkStatus->setAccessibleName(Translated("Status"));
+    m_pkStatus->setAccessibleName(ToolText("Status"));
     m_pkStatus->setTextFormat(Qt::PlainText);
     m_pkStatus->setWordWrap(true);
     // Two lines always, so that nothing moves with the words, and no word makes the window wider.
@@ -191,7 +191,7 @@ QLayout* CGaitToolWindow::MakeButtons(std::initializer_list<int> ids)
 QPushButton* CGaitToolWindow::MakeButton(int id)
 {
     const auto* const text = std::ranges::find(kButtonTexts, id, &ButtonText::m_iID);
-    auto* const button = new QPushButton(Translated(text->m_pcText), this);
+    auto* const button = new QPushButton(ToolText(text->m_pcText), this);
     button->setObjectName(QString::number(id));
     button->setAccessibleName(button->text());
     button->setAutoDefault(false); // Enter in a tree or list is not a click

@@ -53,12 +53,12 @@ std::span<const ButtonRow> RowsOf(EButtons buttons)
     return kOKRows;
 }
 
-constexpr int kIconSide = 36;
+constexpr int kLetterSide = 36;
 constexpr int kTextWidth = 440;
 constexpr int kLeastWidth = 320;
 constexpr double kMostOfScreen = 0.6; // of its height, for the whole box
 
-QString Own(const char* text)
+QString BoxText(const char* text)
 {
     return QCoreApplication::translate("CMessageBox", text);
 }
@@ -67,7 +67,7 @@ QString Own(const char* text)
 class CMessageIcon : public QWidget
 {
 public:
-    explicit CMessageIcon(QChar letter) : m_kLetter(letter) { setFixedSize(kIconSide, kIconSide); }
+    explicit CMessageIcon(QChar letter) : m_kLetter(letter) { setFixedSize(kLetterSide, kLetterSide); }
 
 protected:
     void paintEvent(QPaintEvent*) override
@@ -77,7 +77,7 @@ protected:
         painter.setPen(QPen(palette().windowText(), 2));
         painter.drawEllipse(QRectF(rect()).adjusted(2, 2, -2, -2));
         QFont letters = font();
-        letters.setPixelSize(kIconSide / 2);
+        letters.setPixelSize(kLetterSide / 2);
         letters.setBold(true);
         painter.setFont(letters);
         painter.drawText(rect(), Qt::AlignCenter, m_kLetter);
@@ -90,7 +90,7 @@ private:
 QWidget* MakeIcon(bool asks)
 {
     auto* icon = new CMessageIcon(QLatin1Char(asks ? '?' : 'i'));
-    return Named(icon, "icon", asks ? Own("Question") : Own("Information"));
+    return Named(icon, "icon", asks ? BoxText("Question") : BoxText("Information"));
 }
 
 // A path is one long word, which a label would not wrap: it gets places to break at, which are not seen.
@@ -162,12 +162,12 @@ QWidget* CMessageBox::MakeText(const QString& text)
 
 QWidget* CMessageBox::MakeDetails(const QString& details)
 {
-    m_pkDetails = Named(new QPlainTextEdit(details, this), "detailsText", Own("Details"));
+    m_pkDetails = Named(new QPlainTextEdit(details, this), "detailsText", BoxText("Details"));
     m_pkDetails->ensurePolished(); // the style sheet may change the font
     m_pkDetails->setReadOnly(true);
     m_pkDetails->setTabChangesFocus(true);
     m_pkDetails->setWordWrapMode(QTextOption::WrapAtWordBoundaryOrAnywhere);
-    m_pkDetails->setMinimumWidth(kIconSide + kDialogMargin + kTextWidth);
+    m_pkDetails->setMinimumWidth(kLetterSide + kDialogMargin + kTextWidth);
     m_pkDetails->hide();
     return m_pkDetails;
 }
@@ -179,8 +179,8 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
     layout->setSpacing(kDialogSpacing);
     for (const ButtonRow& row : RowsOf(buttons))
     {
-        auto* button =
-            Named(new QPushButton(Own(row.text), this), row.name, Own(row.text).remove(QLatin1Char('&')));
+        auto* button = Named(new QPushButton(BoxText(row.text), this), row.name,
+                             BoxText(row.text).remove(QLatin1Char('&')));
         button->setMinimumWidth(kButtonWidth);
         button->setDefault(layout->count() == 1);
         connect(button, &QPushButton::clicked, this, [this, &row] { done(static_cast<int>(row.answer)); });
@@ -194,13 +194,13 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
 // To the left of the others, and behind them in the order of the keyboard.
 void CMessageBox::AddDetailsButtons(QBoxLayout& layout)
 {
-    m_pkFold = Named(new QToolButton(this), "details", Own("Details"));
-    m_pkFold->setText(Own("&Details"));
+    m_pkFold = Named(new QToolButton(this), "details", BoxText("Details"));
+    m_pkFold->setText(BoxText("&Details"));
     m_pkFold->setToolButtonStyle(Qt::ToolButtonTextBesideIcon);
     m_pkFold->setArrowType(Qt::RightArrow);
     m_pkFold->setCheckable(true);
     m_pkFold->setFocusPolicy(Qt::StrongFocus);
-    auto* copy = Named(new QPushButton(Own("Co&py"), this), "copy", Own("Copy the details"));
+    auto* copy = Named(new QPushButton(BoxText("Co&py"), this), "copy", BoxText("Copy the details"));
     copy->setAutoDefault(false);
     copy->hide();
     connect(m_pkFold, &QToolButton::toggled, this, [this, copy](bool visible) {

@@ -33,7 +33,7 @@ constexpr int kHeight = 400;
 constexpr int kIconSide = 16;
 constexpr int kFilterHeight = 35; // more of it where a filter is shown
 
-QString Own(const char* text)
+QString DialogText(const char* text)
 {
     return QCoreApplication::translate("CSelectFolderDialog", text);
 }
@@ -93,8 +93,8 @@ QStringList Patterns(const CFileFilter& choice)
 CSelectFolderDialog::CSelectFolderDialog(QWidget* owner, const CFileDialogSetup& setup)
     : QDialog(owner), m_pkModel(new CFolderModel(this))
 {
-    Named(this, "selectFolder", Own("Select folder"));
-    setWindowTitle(Own("Select folder"));
+    Named(this, "selectFolder", DialogText("Select folder"));
+    setWindowTitle(DialogText("Select folder"));
     m_pkModel->setFilter(QDir::AllDirs | QDir::Drives | QDir::NoDotAndDotDot);
     m_pkModel->setNameFilterDisables(false);
     m_pkModel->sort(0);
@@ -114,12 +114,13 @@ CSelectFolderDialog::CSelectFolderDialog(QWidget* owner, const CFileDialogSetup&
 
 QLayout* CSelectFolderDialog::MakePathRow()
 {
-    auto* label = Named(new QLabel(Own("Current Folder"), this), "currentFolder", Own("Current Folder"));
-    m_pkPath = Named(new QLineEdit(this), "102", Own("Current Folder"));
+    auto* label =
+        Named(new QLabel(DialogText("Current Folder"), this), "currentFolder", DialogText("Current Folder"));
+    m_pkPath = Named(new QLineEdit(this), "102", DialogText("Current Folder"));
     label->setBuddy(m_pkPath);
-    m_pkUp = Named(new QToolButton(this), "up", Own("Up one folder"));
+    m_pkUp = Named(new QToolButton(this), "up", DialogText("Up one folder"));
     m_pkUp->setArrowType(Qt::UpArrow);
-    m_pkUp->setToolTip(Own("Up one folder (Alt+Up)"));
+    m_pkUp->setToolTip(DialogText("Up one folder (Alt+Up)"));
     m_pkUp->setShortcut(Qt::ALT | Qt::Key_Up);
     m_pkUp->setFocusPolicy(Qt::StrongFocus);
     connect(m_pkUp, &QToolButton::clicked, this, [this] { OpenParent(); });
@@ -135,7 +136,7 @@ QLayout* CSelectFolderDialog::MakePathRow()
 
 QWidget* CSelectFolderDialog::MakeList()
 {
-    m_pkFolders = Named(new QListView(this), "folders", Own("Folders"));
+    m_pkFolders = Named(new QListView(this), "folders", DialogText("Folders"));
     m_pkFolders->setModel(m_pkModel);
     m_pkFolders->setUniformItemSizes(true);
     m_pkFolders->setSpacing(2);
@@ -147,8 +148,9 @@ QWidget* CSelectFolderDialog::MakeList()
 
 QLayout* CSelectFolderDialog::MakeFilterRow(const std::string& filter)
 {
-    auto* label = Named(new QLabel(Own("&Files shown"), this), "filterLabel", Own("Files shown"));
-    m_pkFilter = Named(new QComboBox(this), "filter", Own("Files shown"));
+    auto* label =
+        Named(new QLabel(DialogText("&Files shown"), this), "filterLabel", DialogText("Files shown"));
+    m_pkFilter = Named(new QComboBox(this), "filter", DialogText("Files shown"));
     label->setBuddy(m_pkFilter);
     connect(m_pkFilter, &QComboBox::currentIndexChanged, this,
             [this](int choice) { m_pkModel->setNameFilters(m_pkFilter->itemData(choice).toStringList()); });
@@ -164,9 +166,9 @@ QLayout* CSelectFolderDialog::MakeFilterRow(const std::string& filter)
 
 QLayout* CSelectFolderDialog::MakeButtons()
 {
-    auto* select = Named(new QPushButton(Own("Select"), this), "select", Own("Select"));
+    auto* select = Named(new QPushButton(DialogText("Select"), this), "select", DialogText("Select"));
     select->setDefault(true);
-    auto* cancel = Named(new QPushButton(Own("Cancel"), this), "cancel", Own("Cancel"));
+    auto* cancel = Named(new QPushButton(DialogText("Cancel"), this), "cancel", DialogText("Cancel"));
     connect(select, &QPushButton::clicked, this, [this] { accept(); });
     connect(cancel, &QPushButton::clicked, this, [this] { reject(); });
 
@@ -213,14 +215,14 @@ void CSelectFolderDialog::accept()
     const auto folder = FolderOfText(ToUtf8(m_pkPath->text()), ToUtf8(FolderThatIsOpen()));
     if (!folder)
     {
-        RunMessageBox(this, title, ToUtf8(Own("Invalid Folder")), EButtons::OK);
+        RunMessageBox(this, title, ToUtf8(DialogText("Invalid Folder")), EButtons::OK);
         return;
     }
     // The answer has never made a difference: the caller finds that there is nothing in the folder.
     if (!FolderExists(*folder))
         RunMessageBox(this, title,
                       std::string(FolderName(*folder)) + "\n\n" +
-                          ToUtf8(Own("This path does not exist. Do you want to create it?")),
+                          ToUtf8(DialogText("This path does not exist. Do you want to create it?")),
                       EButtons::YesNo);
     m_kFolder = *folder;
     QDialog::accept();

@@ -1,5 +1,7 @@
 #include "CLimbChain.h"
 
+#include "Directions.h"
+
 #include <algorithm>
 #include <cmath>
 
@@ -13,11 +15,6 @@ constexpr double kReachSlack = 1.00001;
 constexpr double kCosineRounding = 1e-6;
 // Below this share of its length a vector's part across an axis is rounding and has no direction.
 constexpr double kStraight = 1e-6;
-
-Vec3 Across(const Vec3& v, const Vec3& unitAxis)
-{
-    return v - unitAxis * static_cast<float>(Vec3Dot(v, unitAxis));
-}
 
 bool HasDirection(const Vec3& across, const Vec3& whole)
 {
