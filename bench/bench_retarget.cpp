@@ -1,6 +1,5 @@
 // What the rules of a conversion take, without reading and writing: both skeletons stand in memory.
 
-#include "ApplyRow.h"
 #include "CMotionFile.h"
 #include "CRetargeter.h"
 #include "FindBone.h"
@@ -52,7 +51,7 @@ public:
         m_kRetargeter.SetScenes(m_kSource.motionRoot.Get(), m_kTarget.motionRoot.Get());
         const CBoneNames sources(m_kSource.motionRoot.Get());
         const CBoneNames targets(m_kTarget.motionRoot.Get());
-        return ApplyRows(profile.rows, sources, targets, m_kRetargeter).IsWhole();
+        return ApplyRows(profile.rows, sources, targets, &m_kRetargeter).IsWhole();
     }
     void Run()
     {

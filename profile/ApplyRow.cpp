@@ -3,10 +3,21 @@
 #include "CMapRowTable.h"
 #include "CRetargeter.h"
 #include "FindBone.h"
+#include "HostBones.h"
+#include "Text.h"
+
+#include <cstdint>
 
 namespace gw {
 
 namespace {
+
+enum class ERowFit : uint8_t
+{
+    Missing, // a bone of the row is in no skeleton: nothing was set
+    Fixed,   // the target bone takes no source
+    Mapped,  // source and target are there
+};
 
 Vec3 Degrees(const CRowNumbers& numbers)
 {
@@ -24,8 +35,6 @@ void SetMapping(CRetargeter& retargeter, CNode* target, CNode* source, const CRo
     if (axes != kMat3Identity)
         retargeter.SetOffsetMatrix(target, axes);
 }
-
-} // namespace
 
 ERowFit ApplyRow(const CMapRowTable& rows, int row, const CBoneNames& sources, const CBoneNames& targets,
                  CRetargeter* retargeter)
@@ -45,6 +54,26 @@ ERowFit ApplyRow(const CMapRowTable& rows, int row, const CBoneNames& sources, c
     if (retargeter)
         SetMapping(*retargeter, target, source, rows.Numbers(row));
     return ERowFit::Mapped;
+}
+
+} // namespace
+
+RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
+                   CRetargeter* retargeter, const std::function<void(int row)>& onMapped)
+{
+    RowMatch match;
+    for (int row = 0; row < rows.RowCount(); ++row)
+    {
+        const ERowFit fit = ApplyRow(rows, row, sources, targets, retargeter);
+        ++match.rowCount;
+        match.foundCount += fit == ERowFit::Missing ? 0 : 1;
+        match.mappedCount += fit == ERowFit::Mapped ? 1 : 0;
+        if (fit == ERowFit::Mapped && onMapped)
+            onMapped(row);
+        if (EqualNoCase(rows.Text(row, kTargetColumn), kRootBone))
+            match.drivesRoot = fit == ERowFit::Mapped;
+    }
+    return match;
 }
 
 } // namespace gw

@@ -1,6 +1,6 @@
 #pragma once
 
-#include <cstdint>
+#include <functional>
 
 namespace gw {
 
@@ -8,17 +8,24 @@ class CBoneNames;
 class CMapRowTable;
 class CRetargeter;
 
-/// What became of a row.
-enum class ERowFit : uint8_t
+/// The target skeleton's shares, in the folder of base.htr.
+inline constexpr const char* kShareFile = "KsBone.bsm";
+
+/// How many rows there are, fixed ones included, and how many find their bones.
+struct RowMatch
 {
-    Missing, ///< a bone of the row is in no skeleton: nothing was set
-    Fixed,   ///< the target bone takes no source
-    Mapped,  ///< source and target are there
+    int rowCount = 0;
+    int foundCount = 0;
+    int mappedCount = 0;     ///< those of them that have a source
+    bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
+
+    /// Whether a conversion accepts the rows.
+    bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
 };
 
-/// Looks up the bones of a row and, where a retargeter is given, tells it what the row says: only what
-/// differs from the retargeter's defaults.
-ERowFit ApplyRow(const CMapRowTable& rows, int row, const CBoneNames& sources, const CBoneNames& targets,
-                 CRetargeter* retargeter);
+/// Looks up the bones of all rows. Tells a retargeter, unless it is null, what those say whose bones are
+/// there: only what differs from its defaults. `onMapped` is called for each of them that has a source.
+RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
+                   CRetargeter* retargeter, const std::function<void(int row)>& onMapped = {});
 
 } // namespace gw

@@ -26,8 +26,6 @@ enum EEditorMessage : int
     kAskOverwrite = 163,
 };
 
-constexpr const char* kShareFile = "KsBone.bsm";
-
 bool IsPelvis(std::string_view bone)
 {
     return std::ranges::any_of(kPelvisBones,
@@ -137,20 +135,14 @@ bool CProfileEditorDialog::ApplyProfile(CRetargeter* retargeter, int* matched, i
         retargeter->ClearMaps();
         retargeter->SetScenes(m_pkSourceScene, m_pkResultScene);
     }
-    const CBoneNames sources(m_pkSourceScene);
-    const CBoneNames targets(m_pkResultScene);
-    int found = 0;
-    for (int row = 0; row < m_kRows.RowCount(); ++row)
-    {
-        const ERowFit fit = ApplyRow(m_kRows, row, sources, targets, retargeter);
-        if (fit == ERowFit::Mapped)
+    const RowMatch match = ApplyRows(
+        m_kRows, CBoneNames(m_pkSourceScene), CBoneNames(m_pkResultScene), retargeter, [this](int row) {
             MarkRowBones(m_kRows.Text(row, kSourceColumn), m_kRows.Text(row, kTargetColumn), true);
-        found += fit == ERowFit::Missing ? 0 : 1;
-    }
+        });
     if (retargeter)
         retargeter->LoadShares(m_kOwner.ExeFile(kShareFile));
-    StoreCounts(found, m_kRows.RowCount(), matched, total);
-    return found == m_kRows.RowCount();
+    StoreCounts(match.foundCount, match.rowCount, matched, total);
+    return match.foundCount == match.rowCount;
 }
 
 // By value: the path may be the member that reading changes.

@@ -10,12 +10,6 @@
 
 namespace gw {
 
-namespace {
-
-constexpr int kOffsetLimit = 10'000;
-
-} // namespace
-
 const std::string& CProfileFields::Text(int id) const
 {
     static const std::string kNoText;

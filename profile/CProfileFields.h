@@ -14,6 +14,8 @@ class CProfileOwner;
 /// The frame rates that the editor accepts. A file may hold others, which count all the same.
 inline constexpr int kLowestFrameRate = 30;
 inline constexpr int kHighestFrameRate = 240;
+/// How far the root's position may lie from 0, on each axis.
+inline constexpr int kOffsetLimit = 10'000;
 /// The message about a number outside its limits, formatted with the two limits.
 inline constexpr int kNumberLimitsMessage = 157;
 

@@ -54,13 +54,13 @@ private:
 void CSkeletons::Match(ProfileChoice& choice) const
 {
     CRetargeter table;
-    choice.match = ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
+    choice.match = ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, &table);
 }
 
 void CSkeletons::Judge(ProfileChoice& choice)
 {
     CRetargeter table;
-    ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, table);
+    ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, &table);
     choice.verdict = JudgeProfile(table, m_kTargetNodes, Body());
 }
 

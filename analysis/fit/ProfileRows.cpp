@@ -1,9 +1,6 @@
 #include "ProfileRows.h"
 
-#include "ApplyRow.h"
-#include "CRetargeter.h"
 #include "FindBone.h"
-#include "HostBones.h"
 #include "ProfileFile.h"
 #include "SharedPrefix.h"
 #include "Text.h"
@@ -21,9 +18,11 @@ void TakeLine(const CProfileLine& line, ProfileRows& profile)
     {
     case EProfileLine::Position:
         profile.position = line.position;
+        profile.positionLine = line.line;
         break;
     case EProfileLine::FrameRate:
         profile.frameRate = line.frameRate;
+        profile.frameRateLine = line.line;
         break;
     case EProfileLine::Fixed:
     case EProfileLine::Mapping:
@@ -100,22 +99,6 @@ CMapRowTable WithPrefix(const CMapRowTable& rows, std::string_view oldPrefix, st
         changed.AddRow(source, rows.Text(row, kTargetColumn), rows.Numbers(row), ERowColumns::All);
     }
     return changed;
-}
-
-RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
-                   CRetargeter& table)
-{
-    RowMatch match;
-    for (int row = 0; row < rows.RowCount(); ++row)
-    {
-        const ERowFit fit = ApplyRow(rows, row, sources, targets, &table);
-        ++match.rowCount;
-        match.foundCount += fit == ERowFit::Missing ? 0 : 1;
-        match.mappedCount += fit == ERowFit::Mapped ? 1 : 0;
-        if (EqualNoCase(rows.Text(row, kTargetColumn), kRootBone))
-            match.drivesRoot = fit == ERowFit::Mapped;
-    }
-    return match;
 }
 
 } // namespace gw

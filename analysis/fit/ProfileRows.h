@@ -1,15 +1,16 @@
 #pragma once
 
+#include "ApplyRow.h"
 #include "CMapRowTable.h"
 #include "Vec3.h"
 
+#include <cstddef>
 #include <string>
 #include <string_view>
 
 namespace gw {
 
 class CBoneNames;
-class CRetargeter;
 
 /// A profile as loading its file would leave it.
 struct ProfileRows
@@ -17,6 +18,8 @@ struct ProfileRows
     std::string name; ///< display name
     int frameRate = 30;
     Vec3 position = kVec3Zero;
+    size_t frameRateLine = 0; ///< in the file, from 1 on; 0 where it has none
+    size_t positionLine = 0;
     CMapRowTable rows; ///< with those of the pelvis bones
 };
 
@@ -35,21 +38,5 @@ std::string TextOf(const ProfileRows& profile);
 std::string SourcePrefix(const CMapRowTable& rows);
 /// The rows with another start in place of that one before every source name.
 CMapRowTable WithPrefix(const CMapRowTable& rows, std::string_view oldPrefix, std::string_view newPrefix);
-
-/// How many rows there are, fixed ones included, and how many find their bones.
-struct RowMatch
-{
-    int rowCount = 0;
-    int foundCount = 0;
-    int mappedCount = 0;     ///< those of them that have a source
-    bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
-
-    /// Whether a conversion accepts the rows.
-    bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
-};
-
-/// Looks up the bones of all rows and tells a retargeter what those say whose bones are there.
-RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
-                   CRetargeter& table);
 
 } // namespace gw

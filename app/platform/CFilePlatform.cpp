@@ -18,7 +18,6 @@ constexpr std::string_view kMaker = "Tessarine";
 constexpr std::string_view kProgramFile = "Tessarine/Gaitwright.conf";
 constexpr std::string_view kMakerFile = "Tessarine.conf"; // what all programs of the maker share
 constexpr std::string_view kSection = "Settings";
-constexpr const char* kTargetFile = "base.htr";
 constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // of an installation
 
 std::string Environment(const char* name)
@@ -95,6 +94,14 @@ bool SplitKeyPath(const std::string& keyPath, std::string& product, std::string&
 }
 
 } // namespace
+
+std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath)
+{
+    std::string folder = platform.ReadHostKey(keyPath, "Custom Data");
+    if (folder.empty())
+        folder = platform.DocumentsFolder();
+    return WithSeparator(WithSeparator(std::move(folder)) + "BVH Profile");
+}
 
 CFilePlatform::CFilePlatform(EPlatformWriting writing, std::string dataFolder)
     : m_bWriting(writing == EPlatformWriting::Yes),

@@ -5,6 +5,9 @@
 
 namespace gw {
 
+/// The target skeleton, in the data folder.
+inline constexpr const char* kTargetFile = "base.htr";
+
 /// What the program asks of the system it runs on: settings, folders, language. Paths are UTF-8.
 class CPlatform
 {
@@ -30,6 +33,10 @@ public:
     /// The thread's locale by its number; the low ten bits are the primary language. 0 where it has none.
     virtual uint32_t ThreadLocale() const = 0;
 };
+
+/// The folder of the user's own profiles with its trailing separator: in the host product's folder of custom
+/// data, whose key path is given, else among the user's documents.
+std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath);
 
 /// The primary language of a locale number.
 constexpr uint32_t PrimaryLanguage(uint32_t locale)

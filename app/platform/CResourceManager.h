@@ -7,6 +7,9 @@
 
 namespace gw {
 
+/// The library of translated strings, in the data folder.
+inline constexpr const char* kResourceLibrary = "GaitForgeRes.dll";
+
 /// Every message's text: from the resource library where it has one, else from the program's own table.
 class CResourceManager
 {

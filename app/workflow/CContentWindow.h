@@ -4,7 +4,6 @@
 #include "CProfileOwner.h"
 #include "CReport.h"
 
-#include <cstddef>
 #include <memory>
 #include <optional>
 #include <string>
@@ -39,9 +38,8 @@ enum class EKey
     LeftShift,
 };
 
-/// The window as the conversion sees it. The desktop window is one implementation, the command line another,
-/// the tests a third that answers from a script. Children are known by name. What a program without a window
-/// never needs has a body here that does nothing.
+/// The window as the workflow sees it. The desktop window is one implementation, the tests another that
+/// answers from a script. Children are known by name. What needs no answer has a body here that does nothing.
 class CContentWindow
 {
 public:
@@ -49,7 +47,7 @@ public:
 
     // Questions
 
-    /// Shows a text until it is answered. The id tells a program without a window which message it is.
+    /// Shows a text until it is answered. The id is that of the message.
     virtual EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) = 0;
     /// A path, or none when the dialog was cancelled.
     virtual std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) = 0;
@@ -64,8 +62,6 @@ public:
     virtual void Report(const CReport&) {}
     /// Whether a person looks at what is reported, so that a doubtful file is examined in full.
     virtual bool ShowsFindings() const { return false; }
-    /// A batch run takes up a file: number from 0 on, number of files, path.
-    virtual void ShowBatchFile(size_t, size_t, const std::string&) {}
     /// Whether an operation has run so long that its user should see how far it is.
     virtual bool IsProgressDue() { return false; }
     /// Paints what is due, in the midst of an operation: no key, no click and no timer comes through.

@@ -3,10 +3,8 @@
 #include "AttachBoneMeshes.h"
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
-#include "CPlatform.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
-#include "FailureWords.h"
 #include "Numbers.h"
 #include "Paths.h"
 #include "SourceTiming.h"
@@ -16,7 +14,6 @@ namespace gw {
 
 namespace {
 
-constexpr std::string_view kContainerExtension = ".orn";
 constexpr std::string_view kProfileExtension = ".prf";
 constexpr const char* kFolderSetting = "MotionSource";
 
@@ -26,18 +23,12 @@ void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
         view->SetScene(root, timing.FrameStep(), timing.lastFrame);
 }
 
-// Whether an alignment mends what a reader warns of.
-bool IsAligned(EFailure reason)
-{
-    return reason == EFailure::RestPose || reason == EFailure::DoubledOffsets;
-}
-
 } // namespace
 
 CGaitConvertContent::CGaitConvertContent(CContentWindow& window, CPlatform& platform)
     : m_kWindow(window), m_kPlatform(platform)
 {
-    m_kResources.OpenLibrary(platform.DataFolder() + "GaitForgeRes.dll", platform.ThreadLocale());
+    m_kResources.OpenLibrary(platform.DataFolder() + kResourceLibrary, platform.ThreadLocale());
 }
 
 CGaitConvertContent::~CGaitConvertContent() = default;
@@ -132,9 +123,13 @@ int CGaitConvertContent::Open(const std::string& path)
 // source.
 bool CGaitConvertContent::LoadSource(const std::string& path)
 {
-    if (HasExtension(path, kContainerExtension))
-        return LoadSourceScene(path);
-    return LoadMotion(m_kSourceMotion, path);
+    if (!HasExtension(path, kSceneExtension))
+        return LoadMotion(m_kSourceMotion, path);
+    CFailureRecord record;
+    const bool loaded = LoadSourceScene(path, m_spkSourceScene, record);
+    Report(path, record);
+    m_bSourceIsContainer = m_bSourceIsContainer || loaded;
+    return loaded;
 }
 
 bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& path)
@@ -142,24 +137,6 @@ bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& pat
     const bool loaded = motion.Load(path);
     Report(path, motion.Record());
     return loaded;
-}
-
-// Reads beside the scene that is open, since a damaged file must leave it as it is.
-bool CGaitConvertContent::LoadSourceScene(const std::string& path)
-{
-    COrrinStream stream;
-    const bool read = stream.LoadFile(path, false);
-    CFailureRecord record = stream.Record();
-    if (read && !record.Failure() && !PreviewTrack(FirstNode(stream.GetRoot(0))))
-        record.Fail(EFailure::NoTrack);
-    Report(path, record);
-    if (!read || record.Failure())
-        return false;
-    m_spkSourceScene.RemoveAllRoots();
-    for (size_t i = 0; i < stream.GetRootCount(); ++i)
-        m_spkSourceScene.AddRoot(stream.GetRoot(i));
-    m_bSourceIsContainer = true;
-    return true;
 }
 
 // Shows the source that was loaded, takes the target skeleton twice and hands all three to the profile
@@ -226,13 +203,7 @@ void CGaitConvertContent::ShowTitle(const std::string& text)
 
 void CGaitConvertContent::Report(const std::string& path, const CFailureRecord& record)
 {
-    if (record.Failure())
-        m_kWindow.Report(MakeReport(path, record.Failure(), false));
-    for (const CFailure& warning : record.Warnings())
-    {
-        if (!m_kChoices.align || !IsAligned(warning.reason))
-            m_kWindow.Report(MakeReport(path, warning, true));
-    }
+    ReportRecord(path, record, m_kChoices, [this](const CReport& report) { m_kWindow.Report(report); });
 }
 
 } // namespace gw

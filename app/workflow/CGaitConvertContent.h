@@ -1,16 +1,17 @@
 #pragma once
 
-#include "AlignReport.h"
+#include "CConversion.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
 #include "COrrinStream.h"
+#include "CPlatform.h"
 #include "CProfileOwner.h"
 #include "CResourceManager.h"
 #include "CRetargeter.h"
 #include "FileStamp.h"
+#include "ResultFile.h"
 
 #include <cstdint>
-#include <functional>
 #include <memory>
 #include <optional>
 #include <span>
@@ -23,42 +24,10 @@ namespace gw {
 class CBoneMapProfile;
 class CCntComboExControl;
 class CContentWindow;
-class CPlatform;
 class CProfileEditorDialog;
-enum class EAlignedJoints : uint8_t;
-struct SourceTiming;
-
-/// Where the target's root stands in the rest pose and in the first frame, in the target skeleton's own unit.
-inline constexpr Vec3 kRootPosition{0.0f, 923.0f, 13.0f};
 
 /// The playbar's last value; the whole motion lies between 0 and this.
 inline constexpr int kScrollRange = 256;
-
-/// What a conversion does beside the rules; all off unless chosen.
-struct ConversionChoices
-{
-    bool align = false;    ///< the source is told from a rest pose that suits the rules
-    bool faithful = false; ///< hips, knees and feet keep to the source
-};
-
-/// What a batch run makes of the files of a folder.
-enum class EBatchJob : uint8_t
-{
-    ToMotion,    ///< of every source (.bvh) an .htr
-    ToContainer, ///< of every .htr an .orn
-};
-
-/// How a batch run goes on after a file.
-enum class EBatchStep : uint8_t
-{
-    Done,
-    Ended,     ///< the run ends with its summary
-    Abandoned, ///< the run ends at once and leaves its title
-};
-
-/// The extension of the files that a batch run takes, and that of its results.
-std::string_view BatchSource(EBatchJob job);
-std::string_view BatchResult(EBatchJob job);
 
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
@@ -87,14 +56,8 @@ public:
     int OpenDropped(const std::string& path);
     int ConvertMotion();
     int SaveResult();
-    int RunBatch();
-    /// The same, with the dialog beginning in a folder; an empty one means that of the last source.
-    int RunBatch(const std::string& folder);
-    /// One file of a batch run, with its number from 0 on. Replaces what is there.
-    EBatchStep RunBatchFile(EBatchJob job, const std::string& source, const std::string& output, size_t index,
-                            size_t count);
-    /// The words at the end of a batch run that was not abandoned: how many files were done.
-    void TellBatch(EBatchJob job, size_t finished);
+    /// The dialog begins in a folder; an empty one means that of the last source.
+    int RunBatch(const std::string& initialFolder = {});
     /// What conversions from now on do beside the rules.
     void SetChoices(const ConversionChoices& choices);
     const ConversionChoices& Choices() const { return m_kChoices; }
@@ -102,12 +65,6 @@ public:
     /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
     /// reported.
     bool WriteResult(const std::string& path);
-    /// Writes the source as a BVH file that is told from a rest pose which suits the rules, by the body that
-    /// the selected profile's rows tell of it; AlignedReport says what was mended. Replaces what is there.
-    /// False, with the reason reported, where nothing was written.
-    bool WriteAligned(const std::string& path);
-    /// What the last alignment found.
-    const AlignReport& AlignedReport() const { return m_kAlignReport; }
     /// Whether the present result may be dropped; asks when it is not saved.
     bool ConfirmDiscard();
     /// Asks the editor, then for the result: whether the window may close.
@@ -127,14 +84,14 @@ public:
     /// A notification of the profile list; code 9 is a choice by hand.
     void OnCntCommand(int code);
     void DeleteSelectedProfile();
-    virtual void RefreshProfileList();
+    void RefreshProfileList();
     /// Reads the display names of the two stock profiles, by which PickStockProfile selects them.
     void KeepStockNames();
     void PruneProfileList();
-    virtual void SelectProfileByName(const std::string& name);
+    void SelectProfileByName(const std::string& name);
     /// Loads a profile that need not be in the list, as if it had been chosen there.
     void UseProfileFile(const std::string& path);
-    virtual void PickStockProfile();
+    void PickStockProfile();
 
     EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) override;
     void ProfileStateChanged() override;
@@ -167,8 +124,6 @@ public:
     CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
     /// The root of the open source, be it a motion file's or a container's; null when nothing is open.
     CNode* SourceRoot() const;
-    /// What the last conversion read: the source, or its aligned copy.
-    CNode* DrivingRoot() const { return m_spkAligned ? m_spkAligned.Get() : SourceRoot(); }
     const CMotionFile& ResultMotion() const { return m_kResultMotion; }
     bool IsConverted() const { return m_bConverted; }
     bool IsSaved() const { return m_bSaved; }
@@ -183,46 +138,29 @@ private:
     // CGaitConvertContent.cpp
     int Open(const std::string& path);
     bool LoadSource(const std::string& path);
-    bool LoadSourceScene(const std::string& path);
     bool LoadMotion(CMotionFile& motion, const std::string& path);
     void ShowSource();
     std::string SourceFolder() const;
     void ShowTitle(const std::string& text);
     void RememberFolder(const std::string& path);
     void ForgetFailedSave();
-    std::string BaseFile() { return ExeFile("base.htr"); }
+    std::string BaseFile() { return ExeFile(kTargetFile); }
     void Report(const std::string& path, const CFailureRecord& record);
 
-    // AlignSource.cpp
-    bool AlignSource(const SourceTiming& timing, EAlignedJoints joints);
-    void ReportRestMisfits();
-
     // ConvertMotion.cpp
-    SourceTiming ConversionTiming() const;
     void LoadResult();
     void ReloadResult();
-    bool PrepareRetargeter();
-    bool PrepareSource(const SourceTiming& timing);
-    void Retarget(const SourceTiming& timing, bool useLegs);
+    bool Retarget(bool heedsShift);
+    ConversionInput Input() const;
     void ShowProgress(size_t done, size_t total);
-    void NormalizeBasePose();
-    void ReportMisfit();
-    bool ReportMissingBones();
 
     // DraftProfile.cpp
     std::string DraftName() const;
     void OpenDraft(const std::string& name);
     void ReportFindings(const std::string& path);
 
-    // SaveResult.cpp
-    bool WritePackage(const std::string& path);
-    bool WriteMotion(const std::string& path, float rate);
-    bool SaveMotion(float rate, const std::function<bool(float frameScale)>& save);
-    int ProfileRate() const;
-    static std::string WithExtension(const std::string& path, std::string_view extension);
-
     // ConvertBatch.cpp
-    void ShowBatchFile(const std::string& path, size_t index, size_t count);
+    EBatchStep RunBatchFile(EBatchJob job, const std::string& path, size_t index);
     EBatchStep ConvertFile(const std::string& path, const std::string& output);
     EBatchStep PackageFile(const std::string& path, const std::string& output);
     bool SelectProfileAgain();
@@ -276,8 +214,6 @@ private:
     std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                           ///< what SetTitle was given last
     ConversionChoices m_kChoices;
-    Ref<CNode> m_spkAligned; ///< what the retargeter reads in the source's place; null for the source itself
-    AlignReport m_kAlignReport;
     bool m_bConverted = false;              ///< a conversion has been made for the open source
     bool m_bSaved = true;                   ///< the result has been saved, or there was none
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's

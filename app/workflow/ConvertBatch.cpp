@@ -1,14 +1,12 @@
 // One folder, every file of a kind, no questions: sources to HTR files, or HTR files to containers.
 
+#include "CBoneMapProfile.h"
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
-#include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "FailureWords.h"
-#include "Packaging.h"
 #include "Paths.h"
-#include "SourceTiming.h"
 #include "StringTable.h"
 
 namespace gw {
@@ -16,26 +14,8 @@ namespace gw {
 namespace {
 
 constexpr const char* kFilter = "BVH file to HTR(*.bvh)|*.bvh|HTR file to ORN(*.htr)|*.htr|";
-// Unlike an interactive save: at a profile rate of 30 the frames stay as many as they are.
-constexpr float kBatchRate = 30.0f;
-constexpr float kPackageRate = 60.0f;
 
 } // namespace
-
-std::string_view BatchSource(EBatchJob job)
-{
-    return job == EBatchJob::ToMotion ? ".bvh" : ".htr";
-}
-
-std::string_view BatchResult(EBatchJob job)
-{
-    return job == EBatchJob::ToMotion ? ".htr" : ".orn";
-}
-
-int CGaitConvertContent::RunBatch()
-{
-    return RunBatch({});
-}
 
 int CGaitConvertContent::RunBatch(const std::string& initialFolder)
 {
@@ -54,37 +34,25 @@ int CGaitConvertContent::RunBatch(const std::string& initialFolder)
     size_t finished = 0;
     while (finished < names.size() && step == EBatchStep::Done)
     {
-        const std::string path = folder + names[finished];
-        step = RunBatchFile(job, path, WithExtension(path, BatchResult(job)), finished, names.size());
+        step = RunBatchFile(job, folder + names[finished], finished);
         finished += step == EBatchStep::Done ? 1 : 0;
     }
     if (step == EBatchStep::Abandoned)
         return 0;
-    TellBatch(job, finished);
-    return 1;
-}
-
-EBatchStep CGaitConvertContent::RunBatchFile(EBatchJob job, const std::string& source,
-                                             const std::string& output, size_t index, size_t count)
-{
-    ShowBatchFile(source, index, count);
-    return job == EBatchJob::ToMotion ? ConvertFile(source, output) : PackageFile(source, output);
-}
-
-void CGaitConvertContent::TellBatch(EBatchJob job, size_t finished)
-{
     const int count[] = {static_cast<int>(finished)};
     ShowMessage(job == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage, EButtons::OK, count);
     SetTitle({});
+    return 1;
 }
 
-void CGaitConvertContent::ShowBatchFile(const std::string& path, size_t index, size_t count)
+EBatchStep CGaitConvertContent::RunBatchFile(EBatchJob job, const std::string& path, size_t index)
 {
     const std::string arguments[] = {std::to_string(index + 1), SplitPath(path).stem};
     SetTitle(FormatText(Message(kBatchTitleMessage), arguments));
-    m_kWindow.ShowBatchFile(index, count, path);
     ForViews(&CMotionView::Stop);
     m_kWindow.StayPainted();
+    const std::string output = WithExtension(path, BatchResult(job));
+    return job == EBatchJob::ToMotion ? ConvertFile(path, output) : PackageFile(path, output);
 }
 
 EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::string& output)
@@ -98,15 +66,11 @@ EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::
     m_kSourcePath = path;
     RememberFolder(path);
     ShowSource();
-    const SourceTiming timing = TimingOf(m_kSourceMotion);
-    if (!SelectProfileAgain() || !PrepareRetargeter() || !PrepareSource(timing))
-    {
-        ShowMessage(kCannotConvertMessage, EButtons::OK);
+    if (!SelectProfileAgain() || !Retarget(false))
         return EBatchStep::Abandoned;
-    }
-    Retarget(timing, true); // Shift has no say here
     m_kWriteRecord.Clear();
-    const bool saved = WriteMotion(output, kBatchRate);
+    const bool saved =
+        WriteMotionFile(m_kResultMotion, output, kBatchRate, m_pkProfile->GetFrameRate(), m_kWriteRecord);
     Report(path, m_kWriteRecord);
     return saved ? EBatchStep::Done : EBatchStep::Ended;
 }
@@ -119,6 +83,7 @@ bool CGaitConvertContent::SelectProfileAgain()
     if (!selected)
     {
         m_kWindow.Report(MakeReport({}, EMisfit::NoProfile));
+        ShowMessage(kCannotConvertMessage, EButtons::OK);
         return false;
     }
     SelectProfileByName(std::string(*selected));
@@ -128,7 +93,7 @@ bool CGaitConvertContent::SelectProfileAgain()
 EBatchStep CGaitConvertContent::PackageFile(const std::string& path, const std::string& output)
 {
     CFailureRecord record;
-    const bool packaged = PackageMotion(path, output, kPackageRate, kPackageRate, record);
+    const bool packaged = PackageMotionFile(path, output, record);
     Report(path, record);
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }

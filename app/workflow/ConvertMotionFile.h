@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CGaitConvertContent.h"
+#include "CConversion.h"
 #include "CReport.h"
 
 #include <string>
@@ -25,8 +25,8 @@ struct MotionFileResult
     std::vector<CReport> reports; ///< warnings, and where nothing was written at least one that is none
 };
 
-/// Opens, converts and saves one motion by the state machine that window and shell have, with no settings and
-/// no folders left behind: for programs that link the engine.
+/// Opens, converts and saves one motion as window and shell do: for programs that link the engine. Leaves no
+/// settings and no folders behind.
 MotionFileResult ConvertMotionFile(const MotionFileJob& job);
 
 } // namespace gw

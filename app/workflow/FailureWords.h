@@ -14,8 +14,10 @@ enum class EMisfit : uint8_t
 {
     NoScene,      ///< no source is open, or base.htr could not be read
     NoProfile,    ///< no profile is selected
+    BadProfile,   ///< the profile's file cannot be read
     NoRootRow,    ///< no row drives the target's root bone
     NoRootSource, ///< the row of the target's root bone is fixed
+    NoFrames,     ///< the source has no frames
     NoBody,       ///< the rows drive too little of a body to align it by
     TurnedAtRest, ///< rows turn limbs when the source stands at rest; `name` is one of its joints
 };

@@ -2,7 +2,6 @@
 
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
-#include "CPlatform.h"
 #include "CStringLibrary.h"
 #include "LanguageCode.h"
 #include "Paths.h"
@@ -26,10 +25,7 @@ std::string CGaitConvertContent::ExeFile(const std::string& name)
 
 std::string CGaitConvertContent::ProfileFile(const std::string& name)
 {
-    std::string folder = m_kPlatform.ReadHostKey(Message(kCustomFolderKeyMessage), "Custom Data");
-    if (folder.empty())
-        folder = m_kPlatform.DocumentsFolder();
-    folder = WithSeparator(WithSeparator(std::move(folder)) + "BVH Profile");
+    const std::string folder = CustomProfileFolder(m_kPlatform, Message(kCustomFolderKeyMessage));
     m_kPlatform.MakeFolder(folder);
     return folder + name;
 }

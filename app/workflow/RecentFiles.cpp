@@ -1,7 +1,6 @@
 // The sources that were opened last.
 
 #include "CGaitConvertContent.h"
-#include "CPlatform.h"
 #include "Text.h"
 
 namespace gw {

@@ -2,6 +2,7 @@
 
 #include "CKeyframeControl.h"
 #include "CMotionFile.h"
+#include "COrrinStream.h"
 #include "CProfileFields.h"
 
 #include <algorithm>
@@ -33,6 +34,22 @@ SourceTiming TimingOf(const CMotionFile& motion)
 SourceTiming TimingOf(const CKeyframeControl* track)
 {
     return track ? SourceTiming{track->m_fEndTime, track->m_fFrequency} : SourceTiming();
+}
+
+// Reads beside the scene that is there, since a damaged file must leave it as it is.
+bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record)
+{
+    COrrinStream stream;
+    const bool read = stream.LoadFile(path, false);
+    record = stream.Record();
+    if (read && !record.Failure() && !PreviewTrack(FirstNode(stream.GetRoot(0))))
+        record.Fail(EFailure::NoTrack);
+    if (!read || record.Failure())
+        return false;
+    scene.RemoveAllRoots();
+    for (size_t i = 0; i < stream.GetRootCount(); ++i)
+        scene.AddRoot(stream.GetRoot(i));
+    return true;
 }
 
 CNode* FirstNode(CObject* root)

@@ -1,11 +1,16 @@
 #pragma once
 
+#include <string>
+#include <string_view>
+
 namespace gw {
 
+class CFailureRecord;
 class CKeyframeControl;
 class CMotionFile;
 class CNode;
 class CObject;
+class COrrinStream;
 
 /// How long a motion is and how its frames are spaced. Frame f is reached at time f / frequency.
 struct SourceTiming
@@ -20,6 +25,13 @@ struct SourceTiming
 SourceTiming TimingOf(const CMotionFile& motion);
 /// No frames for null.
 SourceTiming TimingOf(const CKeyframeControl* track);
+
+/// The extension of a source that is a container.
+inline constexpr std::string_view kSceneExtension = ".orn";
+
+/// Reads a container whose keys can be converted. False, with the failure recorded and the scene left as it
+/// is, for one that is damaged or has none.
+bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record);
 
 /// The first plain node under a container's root, or null.
 CNode* FirstNode(CObject* root);

@@ -106,7 +106,7 @@ TEST_F(BatchTest, AMisfitAbandonsTheRunAndKeepsWhatIsDone)
 TEST_F(BatchTest, APackageThatCannotBeReadEndsTheRunWithoutAWord)
 {
     Write("run/a.htr", "text");
-    m_kWindow.m_kOnBatchFile = [](const std::string& path) { DeleteFile(path); };
+    m_kWindow.m_kOnPaint = [this] { DeleteFile(m_kFolder.Path("run/a.htr")); };
     EXPECT_EQ(Run("run/", 2, ""), 0);
     EXPECT_EQ(m_kWindow.TakeWords().find("not-found"), 0u);
     EXPECT_EQ(m_kWindow.m_kBoxes.back(), "");

@@ -2,6 +2,8 @@
 
 #include "ContentFixture.h"
 
+#include "BoneMeshQueries.h"
+#include "CFileConversion.h"
 #include "CProfileEditorDialog.h"
 #include "FindBone.h"
 #include "Paths.h"
@@ -161,6 +163,10 @@ TEST_F(ContentTest, AContainerConverts)
     ASSERT_EQ(Open(WriteContainer("scene.orn")), 1);
     EXPECT_EQ(m_kContent.ConvertMotion(), 1);
     EXPECT_EQ(m_kContent.ResultMotion().GetLastFrame(), 1.0f);
+
+    CFileConversion alone(m_kFolder.Path("data/"), {}, [](const CReport&) {});
+    ASSERT_TRUE(alone.LoadSource(m_kFolder.Path("scene.orn")));
+    EXPECT_TRUE(FindBoneMesh(*alone.SourceRoot())) << "without a window too: it tells how the bone points";
 }
 
 TEST_F(ContentTest, AProfileThatDoesNotFitStopsTheConversion)

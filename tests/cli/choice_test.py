@@ -8,11 +8,6 @@ STRAIGHT = "MotionBuilder / HumanIK (3 spine joints)"
 
 
 class Choice(CliTest):
-    def setUp(self):
-        super().setUp()
-        (self.folder / "temp").mkdir()
-        self.environment["TMPDIR"] = str(self.folder / "temp")
-
     def test_a_prefix_is_told_and_gives_the_same_bytes(self):
         self.write("plain.bvh", body())
         self.succeed("convert", "plain.bvh", "-o", "plain.htr", "--profile", STRAIGHT)
@@ -24,15 +19,6 @@ class Choice(CliTest):
                 self.assertEqual(told["profilePath"], str(ASSETS / "HumanIK03.prf"))
                 self.assertEqual((told["sureness"], told["doubts"], told["warnings"]), ("sure", [], []))
                 self.assertEqual(self.read("a.htr"), self.read("plain.htr"))
-        self.assertEqual([name for name in self.files() if name.startswith("temp/")], [])
-
-    def test_without_a_place_for_temporary_files_that_is_said(self):
-        self.environment["TMPDIR"] = str(self.folder / "nowhere")
-        self.write("a.bvh", body("Model_"))
-        result = self.with_assets("convert", "a.bvh", "-o", "a.htr")
-        self.assertEqual(result.code, FAILED)
-        self.assert_words(result, ["temporary"])
-        self.assertNotIn("a.htr", self.files())
 
     def test_a_doubtful_profile_is_taken_only_by_name(self):
         self.write("a.bvh", body(swapped=True))
@@ -88,7 +74,6 @@ class Choice(CliTest):
             self.write("takes/%s.bvh" % name, body("Model_"))
         self.succeed("batch", "takes", "--job", "htr")
         self.assertEqual(self.read("takes/one.htr"), self.read("takes/two.htr"))
-        self.assertEqual([name for name in self.files() if name.startswith("temp/")], [])
 
 
 if __name__ == "__main__":

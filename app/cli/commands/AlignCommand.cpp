@@ -1,13 +1,10 @@
 #include "AlignReport.h"
-#include "CFilePlatform.h"
 #include "CJsonWriter.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
-#include "ProfileChoice.h"
-#include "ProfileFit.h"
 #include "ReportJson.h"
 #include "Text.h"
 #include "Words.h"
@@ -55,14 +52,7 @@ std::string MendedText(const AlignReport& report)
     return text.empty() ? "nothing to align" : text;
 }
 
-bool SelectProfile(const COptions& options, CShellContent& content)
-{
-    std::optional<CProfileFit> nearest;
-    return options.profile.empty() ? content.SelectFittingProfile(options.files[0], nearest)
-                                   : content.SelectProfile(options.profile);
-}
-
-void WriteJson(const COptions& options, const CShellWindow& window, const AlignReport& report, bool written)
+void WriteJson(const COptions& options, const CShellReports& reports, const AlignReport& report, bool written)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -80,15 +70,9 @@ void WriteJson(const COptions& options, const CShellWindow& window, const AlignR
         json.EndObject();
     }
     json.EndArray();
-    WriteReports(json, window.Reports());
+    WriteReports(json, reports.All());
     json.EndObject();
     json.EndDocument();
-}
-
-bool Align(const COptions& options, CShellWindow& window, CShellContent& content)
-{
-    return content.OpenSource() != 0 && !window.HasFailed() && SelectProfile(options, content) &&
-           content.WriteAligned(options.output);
 }
 
 } // namespace
@@ -102,17 +86,15 @@ EExit RunAlign(const COptions& options)
     }
     if (!MayWrite(options, options.output))
         return EExit::Failed;
-    CShellWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform, PickFor(options));
-    window.SetPaths(options.files[0], {});
-    content.SetChoices({true, false});
-    const bool written = Align(options, window, content);
+    CShellReports reports(options);
+    CShellConversion conversion(options, {true, false}, reports);
+    const bool written = conversion.Open(options.files[0]) && conversion.SelectProfile() &&
+                         conversion.WriteAligned(options.output);
     if (options.json)
-        WriteJson(options, window, content.AlignedReport(), written);
+        WriteJson(options, reports, conversion.AlignedReport(), written);
     else if (written && !options.quiet)
         std::printf("%s -> %s: %s\n", Printable(options.files[0]).c_str(), Printable(options.output).c_str(),
-                    MendedText(content.AlignedReport()).c_str());
+                    MendedText(conversion.AlignedReport()).c_str());
     return written ? EExit::Done : EExit::Failed;
 }
 

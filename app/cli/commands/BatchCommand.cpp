@@ -1,13 +1,10 @@
 #include "CBatchRun.h"
-#include "CCntComboExControl.h"
-#include "CFilePlatform.h"
 #include "CJsonWriter.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
-#include "ProfileFit.h"
 #include "ReportJson.h"
 #include "RunSetup.h"
 #include "SourceList.h"
@@ -16,7 +13,6 @@
 
 #include <algorithm>
 #include <cstdio>
-#include <optional>
 
 namespace gw {
 
@@ -24,18 +20,11 @@ namespace {
 
 // The desktop program takes the profile that is selected. Without --profile it is the one that `convert`
 // would take for the first file.
-bool SelectProfile(const COptions& options, CShellWindow& window, CShellContent& content,
-                   const std::string& first)
+bool SelectProfile(const COptions& options, CShellConversion& conversion, const std::string& first)
 {
     if (options.job != "htr")
         return true;
-    if (!options.profile.empty())
-        return content.SelectProfile(options.profile);
-    window.SetPaths(first, {});
-    if (content.OpenSource() == 0 || window.HasFailed())
-        return false;
-    std::optional<CProfileFit> nearest;
-    return content.SelectFittingProfile(first, nearest);
+    return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
 }
 
 void WriteJson(const COptions& options, const std::vector<CReport>& reports, size_t finished)
@@ -61,13 +50,12 @@ size_t FinishedCount(const COptions& options, const CBatchRun& run, bool failed)
 
 EExit RunBatchJobs(const COptions& options, const CFileRun::Jobs& jobs)
 {
-    CShellWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
-    CBatchRun run(options, jobs, StateOf(options), content, window);
-    const bool begins = SelectProfile(options, window, content, jobs.front().source);
+    CShellReports ownReports(options);
+    CShellConversion conversion(options, {}, ownReports);
+    CBatchRun run(options, jobs, StateOf(options), conversion, ownReports);
+    const bool begins = SelectProfile(options, conversion, jobs.front().source);
     const EExit exit = begins ? run.RunAll() : EExit::Failed;
-    std::vector<CReport> reports = window.Reports();
+    std::vector<CReport> reports = ownReports.All();
     reports.insert(reports.end(), run.Reports().begin(), run.Reports().end());
     const bool failed = exit == EExit::Failed || !std::ranges::all_of(reports, &CReport::warning);
     if (options.json)

@@ -1,12 +1,10 @@
 #include "BonePairs.h"
 #include "CConversionPage.h"
-#include "CFilePlatform.h"
-#include "CJsonWriter.h"
 #include "CKeyframeControl.h"
 #include "CPagePart.h"
 #include "CSceneFile.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "CheckResult.h"
 #include "CommandTable.h"
 #include "CompareReport.h"
@@ -39,32 +37,28 @@ class CComparedSource
 {
 public:
     explicit CComparedSource(const COptions& options)
-        : m_kOptions(options), m_kWindow(options), m_kPlatform(EPlatformWriting::No, options.dataFolder),
-          m_kContent(m_kWindow, m_kPlatform, EStockPick::Never)
+        : m_kOptions(options), m_kReports(options), m_kConversion(options, {true, false}, m_kReports)
     {
     }
 
-    std::string FindProfile() { return m_kContent.ResolveProfile(m_kOptions.profile); }
-    bool Load(const std::string& profilePath) { return m_kOptions.align ? Align(profilePath) : LoadFile(); }
+    std::string FindProfile() { return m_kConversion.ResolveProfile(m_kOptions.profile); }
+    bool Load() { return m_kOptions.align ? Align() : LoadFile(); }
     MotionClip Clip();
 
 private:
-    bool Align(const std::string& profilePath);
+    bool Align();
     bool LoadFile();
 
     const COptions& m_kOptions;
-    CShellWindow m_kWindow;
-    CFilePlatform m_kPlatform;
-    CShellContent m_kContent;
+    CShellReports m_kReports;
+    CShellConversion m_kConversion;
     CSceneFile m_kFile;
 };
 
-bool CComparedSource::Align(const std::string& profilePath)
+bool CComparedSource::Align()
 {
-    m_kWindow.SetPaths(m_kOptions.files[0], {});
-    m_kContent.SetChoices({true, false});
-    return m_kContent.OpenSource() != 0 && m_kContent.SelectProfile(profilePath) &&
-           m_kContent.ConvertMotion() != 0;
+    return m_kConversion.Open(m_kOptions.files[0]) && m_kConversion.SelectProfile() &&
+           m_kConversion.Convert(true);
 }
 
 bool CComparedSource::LoadFile()
@@ -79,7 +73,7 @@ bool CComparedSource::LoadFile()
 MotionClip CComparedSource::Clip()
 {
     if (m_kOptions.align)
-        return SourceClipOf(m_kContent);
+        return SourceClipOf(m_kConversion);
     if (!m_kFile.IsContainer())
         return ClipOf(m_kFile.Motion());
     const std::vector<CFoundNode> nodes = m_kFile.Nodes();
@@ -132,7 +126,7 @@ EExit RunCompare(const COptions& options)
     CComparedSource source(options);
     CMotionFile result;
     const std::string profilePath = source.FindProfile();
-    if (profilePath.empty() || !source.Load(profilePath) || !LoadResult(options, options.files[1], result))
+    if (profilePath.empty() || !source.Load() || !LoadResult(options, options.files[1], result))
         return EExit::Failed;
     const MotionClip sourceClip = source.Clip();
     const MotionClip resultClip = ClipOf(result);

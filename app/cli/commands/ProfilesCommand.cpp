@@ -1,7 +1,6 @@
-#include "CFilePlatform.h"
 #include "CJsonWriter.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "CommandTable.h"
 #include "DoubtWords.h"
 #include "FitWords.h"
@@ -27,33 +26,33 @@ struct Entry
     std::optional<ProfileVerdict> verdict; // of one that fits
 };
 
-std::vector<Entry> Installed(CShellContent& content)
+std::vector<Entry> Installed(CShellConversion& conversion)
 {
     std::vector<Entry> entries;
-    for (const CInstalledProfile& profile : content.InstalledProfiles())
+    for (const CInstalledProfile& profile : conversion.InstalledProfiles())
         entries.push_back({profile.name, profile.path, profile.stock, {}, {}});
     return entries;
 }
 
-CProfileFit FitOf(const CShellContent& content, const ProfileChoice& choice)
+CProfileFit FitOf(const CShellConversion& conversion, const ProfileChoice& choice)
 {
     CProfileFit fit{
         choice.profile.name, choice.match.rowCount, choice.match.foundCount, choice.match.drivesRoot, {}};
     if (!choice.match.IsWhole())
-        content.Measure(choice.path, fit);
+        conversion.Measure(choice.path, fit);
     return fit;
 }
 
 // The one that a conversion takes first.
-std::vector<Entry> ByFit(CShellContent& content)
+std::vector<Entry> ByFit(CShellConversion& conversion)
 {
-    const std::vector<CInstalledProfile> installed = content.InstalledProfiles();
+    const std::vector<CInstalledProfile> installed = conversion.InstalledProfiles();
     std::vector<Entry> entries;
-    for (const ProfileChoice& choice : content.Choices())
+    for (const ProfileChoice& choice : conversion.Choices())
     {
         const auto profile = std::ranges::find(installed, choice.path, &CInstalledProfile::path);
         const bool stock = profile != installed.end() && profile->stock;
-        entries.push_back({choice.profile.name, choice.path, stock, FitOf(content, choice), {}});
+        entries.push_back({choice.profile.name, choice.path, stock, FitOf(conversion, choice), {}});
         if (choice.match.IsWhole())
             entries.back().verdict = choice.verdict;
     }
@@ -108,17 +107,12 @@ void WriteJson(const std::vector<Entry>& entries)
 
 EExit RunProfiles(const COptions& options)
 {
-    CShellWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
+    CShellReports reports(options);
+    CShellConversion conversion(options, {}, reports);
     const bool hasSource = !options.files.empty();
-    if (hasSource)
-    {
-        window.SetPaths(options.files[0], {});
-        if (content.OpenSource() == 0 || window.HasFailed())
-            return EExit::Failed;
-    }
-    const std::vector<Entry> entries = hasSource ? ByFit(content) : Installed(content);
+    if (hasSource && !conversion.Open(options.files[0]))
+        return EExit::Failed;
+    const std::vector<Entry> entries = hasSource ? ByFit(conversion) : Installed(conversion);
     if (options.json)
         WriteJson(entries);
     for (const Entry& entry : options.json ? std::vector<Entry>() : entries)

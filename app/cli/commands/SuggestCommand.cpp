@@ -1,10 +1,8 @@
-#include "CFilePlatform.h"
+#include "CFileConversion.h"
 #include "CJsonWriter.h"
-#include "CMotionFile.h"
 #include "CReport.h"
 #include "CSafeFile.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellReports.h"
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
@@ -178,14 +176,6 @@ bool WriteProfile(const std::string& path, const std::string& text)
     return false;
 }
 
-bool LoadTarget(const std::string& path, CMotionFile& target)
-{
-    const bool loaded = target.Load(path);
-    if (!loaded)
-        SayFailure(path, target.Record().Failure());
-    return loaded;
-}
-
 // Results last as long as the source only if the profile has the source's rate.
 void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
 {
@@ -233,18 +223,15 @@ EExit RunSuggest(const COptions& options)
     }
     if (!MayWrite(options, options.output))
         return EExit::Failed;
-    CShellWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    CShellContent content(window, platform);
-    window.SetPaths(options.files[0], {});
-    CMotionFile target;
-    if (content.OpenSource() == 0 || window.HasFailed() || !content.SourceRoot() ||
-        !LoadTarget(platform.DataFolder() + "base.htr", target))
+    CShellReports reports(options);
+    CFileConversion conversion(options.dataFolder, {}, [&](const CReport& report) { reports.Add(report); });
+    if (!conversion.LoadSource(options.files[0]) || !conversion.LoadTarget() || reports.HasFailed())
         return EExit::Failed;
-    const SuggestedProfile profile = SuggestProfile(*content.SourceRoot(), *target.motionRoot);
+    const SuggestedProfile profile =
+        SuggestProfile(*conversion.SourceRoot(), *conversion.Result().motionRoot);
     if (!profile.missing.empty())
         return FailMissing(options.files[0], profile);
-    return Deliver(options, profile, content.SourceRoot());
+    return Deliver(options, profile, conversion.SourceRoot());
 }
 
 } // namespace gw

@@ -1,11 +1,11 @@
 #include "CBatchRun.h"
 
-#include "CBoneMapProfile.h"
 #include "CContentHash.h"
 #include "CJsonWriter.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "ReportJson.h"
+#include "StringTable.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -18,24 +18,44 @@ EBatchJob BatchJobOf(const COptions& options)
     return options.job == "htr" ? EBatchJob::ToMotion : EBatchJob::ToContainer;
 }
 
-CBatchRun::CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellContent& content,
-                     CShellWindow& window)
-    : CFileRun(options, std::move(jobs), std::move(state)), m_kContent(content), m_kWindow(window)
+CBatchRun::CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellConversion& conversion,
+                     CShellReports& reports)
+    : CFileRun(options, std::move(jobs), std::move(state)), m_kConversion(conversion), m_kOwnReports(reports)
 {
 }
 
-EBatchJob CBatchRun::Job() const
+// The profile is read from its file again for every source, unless it was adapted, which no file has.
+EBatchStep CBatchRun::ConvertMotion(const CConversionJob& job)
 {
-    return BatchJobOf(Options());
+    if (!m_kConversion.LoadSource(job.source))
+        return EBatchStep::Ended;
+    m_kConversion.LoadTarget();
+    if (!m_kConversion.IsAdapted())
+        m_kConversion.RereadProfile();
+    if (!m_kConversion.Convert(true))
+        return EBatchStep::Abandoned;
+    return m_kConversion.WriteBatchResult(job.output) ? EBatchStep::Done : EBatchStep::Ended;
+}
+
+EBatchStep CBatchRun::RunJob(const CConversionJob& job)
+{
+    if (BatchJobOf(Options()) == EBatchJob::ToMotion)
+        return ConvertMotion(job);
+    CFailureRecord record;
+    const bool packaged = PackageMotionFile(job.source, job.output, record);
+    m_kConversion.Report(job.source, record);
+    return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 
 // A file of which a failure is told counts as failed, and ends the run only where the desktop program's ends.
 CFileRun::CFileEnd CBatchRun::Convert(const COptions& options, size_t index, std::FILE* record)
 {
     const CConversionJob& job = AllJobs()[index];
-    const size_t before = m_kWindow.Reports().size();
-    const EBatchStep step = m_kContent.RunBatchFile(Job(), job.source, job.output, index, AllJobs().size());
-    const auto reports = std::span(m_kWindow.Reports()).subspan(before);
+    SayWord(Options(), Printable(job.source) + " (" + std::to_string(index + 1) + " of " +
+                           std::to_string(AllJobs().size()) + ')');
+    const size_t before = m_kOwnReports.All().size();
+    const EBatchStep step = RunJob(job);
+    const auto reports = std::span(m_kOwnReports.All()).subspan(before);
     const bool good = step == EBatchStep::Done && std::ranges::all_of(reports, &CReport::warning);
     const EConversion outcome = good ? EConversion::Converted : EConversion::Failed;
     WriteRecord(index, outcome, reports, record);
@@ -46,21 +66,15 @@ CFileRun::CFileEnd CBatchRun::Convert(const COptions& options, size_t index, std
 void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports,
                             std::FILE* record)
 {
-    std::string profile;
-    std::string profilePath;
-    if (Job() == EBatchJob::ToMotion)
-    {
-        m_kContent.Profile()->GetProfileName(profile);
-        profilePath = m_kContent.ToldProfilePath();
-    }
+    const bool converts = BatchJobOf(Options()) == EBatchJob::ToMotion;
     CJsonWriter json(record);
     json.BeginObject();
     json.Key("source").Text(AllJobs()[index].source);
     json.Key("output").Text(AllJobs()[index].output);
     json.Key("outcome").Text(OutcomeName(outcome));
-    json.Key("profile").Text(profile);
-    json.Key("profilePath").Text(profilePath);
-    json.Key("frames").Integer(Job() == EBatchJob::ToMotion ? m_kContent.ResultMotion().GetKeyCount() : 0);
+    json.Key("profile").Text(converts ? m_kConversion.Profile().name : "");
+    json.Key("profilePath").Text(converts ? m_kConversion.ProfilePath() : "");
+    json.Key("frames").Integer(converts ? m_kConversion.Result().GetKeyCount() : 0);
     WriteReports(json, {reports.begin(), reports.end()});
     json.EndObject();
     json.EndDocument();
@@ -79,8 +93,10 @@ void CBatchRun::TellUpToDate(size_t index)
 
 bool CBatchRun::AddProfiles(CContentHash& key)
 {
-    if (Job() == EBatchJob::ToMotion)
-        key.AddFile(m_kContent.ProfilePath());
+    if (BatchJobOf(Options()) == EBatchJob::ToMotion)
+        key.AddFile(m_kConversion.ProfilePath());
+    if (m_kConversion.IsAdapted())
+        key.AddText(TextOf(m_kConversion.Profile()));
     return true;
 }
 
@@ -93,8 +109,10 @@ void CBatchRun::TakeRecord(size_t, EConversion, std::string_view record, std::st
 bool CBatchRun::TellEnd()
 {
     const bool good = !IsAbandoned() && Tally()[EConversion::Failed] == 0;
+    const int message = BatchJobOf(Options()) == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage;
+    const std::string count[] = {std::to_string(Tally()[EConversion::Converted])};
     if (!IsAbandoned())
-        m_kContent.TellBatch(Job(), Tally()[EConversion::Converted]);
+        SayWord(Options(), FormatText(m_kConversion.Message(message), count));
     return good;
 }
 

@@ -1,22 +1,24 @@
 #pragma once
 
 #include "CFileRun.h"
-#include "CGaitConvertContent.h"
 #include "CReport.h"
+#include "ResultFile.h"
+
+#include <span>
 
 namespace gw {
 
-class CShellContent;
-class CShellWindow;
+class CShellConversion;
+class CShellReports;
 
 /// The folder run of the desktop program: one profile for all, chosen before it begins, and its own words.
 /// Every worker has the conversion as it stands then.
 class CBatchRun : public CFileRun
 {
 public:
-    /// Content and window must outlive the run, and so must the options.
-    CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellContent& content,
-              CShellWindow& window);
+    /// Conversion and reports must outlive the run, and so must the options.
+    CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellConversion& conversion,
+              CShellReports& reports);
 
     /// Everything that was reported of the files, in order.
     const std::vector<CReport>& Reports() const { return m_kReports; }
@@ -33,11 +35,12 @@ protected:
     bool TellEnd() override;
 
 private:
-    EBatchJob Job() const;
+    EBatchStep RunJob(const CConversionJob& job);
+    EBatchStep ConvertMotion(const CConversionJob& job);
     void WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports, std::FILE* record);
 
-    CShellContent& m_kContent;
-    CShellWindow& m_kWindow;
+    CShellConversion& m_kConversion;
+    CShellReports& m_kOwnReports; ///< of this process
     std::vector<CReport> m_kReports;
     size_t m_uiTaken = 0;
 };

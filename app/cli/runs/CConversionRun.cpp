@@ -1,11 +1,10 @@
 #include "CConversionRun.h"
 
 #include "CContentHash.h"
-#include "CFilePlatform.h"
 #include "CPagePart.h"
 #include "CReport.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "PageOutput.h"
 
 #include <utility>
@@ -43,16 +42,15 @@ void CConversionRun::TellUpToDate(size_t index)
 // The one that is asked for, or all among which each source chooses.
 bool CConversionRun::AddProfiles(CContentHash& key)
 {
-    CShellWindow window(Options());
-    CFilePlatform platform(EPlatformWriting::No, Options().dataFolder);
-    CShellContent content(window, platform);
+    CShellReports reports(Options());
+    CShellConversion conversion(Options(), {}, reports);
     if (!Options().profile.empty())
     {
-        const std::string path = content.ResolveProfile(Options().profile);
+        const std::string path = conversion.ResolveProfile(Options().profile);
         key.AddFile(path);
         return !path.empty();
     }
-    for (const CInstalledProfile& profile : content.InstalledProfiles())
+    for (const CInstalledProfile& profile : conversion.InstalledProfiles())
         key.AddText(profile.name).AddFile(profile.path);
     return true;
 }

@@ -1,10 +1,8 @@
 #include "CheckResult.h"
 
-#include "CFilePlatform.h"
+#include "CFileConversion.h"
 #include "CKeyframeControl.h"
-#include "CReport.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "COptions.h"
 #include "ConvertFile.h"
 #include "Skeleton.h"
 #include "SourceTiming.h"
@@ -12,19 +10,6 @@
 namespace gw {
 
 namespace {
-
-// What goes wrong beside a conversion that went well is nothing to tell.
-class CSilentWindow : public CShellWindow
-{
-public:
-    using CShellWindow::CShellWindow;
-
-    EAnswer ShowMessageBox(int, const std::string&, EButtons buttons) override
-    {
-        return buttons == EButtons::OK ? EAnswer::OK : EAnswer::No;
-    }
-    void Report(const CReport&) override {}
-};
 
 // New tracks rest in the pose that the rules made of the source's rest; a saved result rests in the target's
 // own, and so is it measured.
@@ -41,22 +26,22 @@ void TakeRestPose(const CMotionFile& result)
 
 } // namespace
 
-MotionClip SourceClipOf(const CShellContent& content)
+MotionClip SourceClipOf(const CFileConversion& conversion)
 {
-    const CKeyframeControl* track = ConversionTrack(content.SourceRoot());
+    const CKeyframeControl* track = ConversionTrack(conversion.SourceRoot());
     if (!track)
         return {};
-    return {content.DrivingRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
+    return {conversion.DrivingRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
 }
 
-ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job)
+ConvertedMotion MotionOf(const CFileConversion& conversion, const CConversionJob& job)
 {
     ConvertedMotion motion;
     motion.source = job.source;
     motion.result = job.output;
-    TakeRestPose(content.ResultMotion());
-    motion.sourceClip = SourceClipOf(content);
-    motion.resultClip = ClipOf(content.ResultMotion());
+    TakeRestPose(conversion.Result());
+    motion.sourceClip = SourceClipOf(conversion);
+    motion.resultClip = ClipOf(conversion.Result());
     return motion;
 }
 
@@ -76,13 +61,11 @@ std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, con
 {
     if (!options.align && !options.faithful)
         return std::nullopt;
-    CSilentWindow window(options);
-    CFilePlatform platform(EPlatformWriting::No, options.dataFolder);
-    window.SetPaths(job.source, job.output);
-    CShellContent content(window, platform, EStockPick::Never);
-    if (content.OpenSource() == 0 || !content.SelectProfile(profilePath) || content.ConvertMotion() == 0)
+    CFileConversion conversion(options.dataFolder, {}, [](const CReport&) {});
+    if (!conversion.LoadSource(job.source) || !conversion.LoadTarget() ||
+        !conversion.UseProfile(profilePath) || !conversion.Convert(!options.noLegs))
         return std::nullopt;
-    return MeasureMotion(MotionOf(content, job), profilePath);
+    return MeasureMotion(MotionOf(conversion, job), profilePath);
 }
 
 } // namespace gw

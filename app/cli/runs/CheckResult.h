@@ -6,17 +6,16 @@
 
 namespace gw {
 
-class CShellContent;
+class CFileConversion;
 struct CConversionJob;
 struct COptions;
 
-/// The source of a content that has converted, as the conversion read it; it moves by the track by which it
-/// was converted.
-MotionClip SourceClipOf(const CShellContent& content);
+/// The source of a conversion that is made, as it was read; it moves by the track by which it was converted.
+MotionClip SourceClipOf(const CFileConversion& conversion);
 
-/// The open source and the result of a content that has converted, as clips of trees that live with it; named
-/// after the job. The result is saved already: its tracks take the target's rest pose.
-ConvertedMotion MotionOf(const CShellContent& content, const CConversionJob& job);
+/// The source and the result of a conversion that is made, as clips of trees that live with it; named after
+/// the job. The result is saved already: its tracks take the target's rest pose.
+ConvertedMotion MotionOf(const CFileConversion& conversion, const CConversionJob& job);
 
 /// Compares source and result by the profile that the conversion used. Returns nothing if the profile can no
 /// longer be read or the motion has no frames.

@@ -1,12 +1,10 @@
 #include "ConvertFile.h"
 
-#include "CBoneMapProfile.h"
-#include "CFilePlatform.h"
 #include "CJsonWriter.h"
 #include "CNode.h"
 #include "CPagePart.h"
-#include "CShellContent.h"
-#include "CShellWindow.h"
+#include "CShellConversion.h"
+#include "CShellReports.h"
 #include "CheckReport.h"
 #include "CheckResult.h"
 #include "DoubtWords.h"
@@ -57,18 +55,15 @@ void KeepUntilExit(CNode* root)
     *free = root;
 }
 
-// One run of the state machine, step by step. Each step answers whether the next may follow.
-class CConversion
+// One job, step by step. Each step answers whether the next may follow.
+class CJobSteps
 {
 public:
-    CConversion(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
-                CPagePart* part)
-        : m_kOptions(options), m_kJob(job), m_kWindow(window), m_kAccount(account), m_pkPart(part),
-          m_kPlatform(EPlatformWriting::No, options.dataFolder),
-          m_kContent(window, m_kPlatform, PickFor(options))
+    CJobSteps(const COptions& options, const CConversionJob& job, CShellReports& reports, Account& account,
+              CPagePart* part)
+        : m_kOptions(options), m_kJob(job), m_kReports(reports), m_kAccount(account), m_pkPart(part),
+          m_kConversion(options, {options.align, options.faithful}, reports)
     {
-        window.SetPaths(job.source, job.output);
-        m_kContent.SetChoices({options.align, options.faithful});
     }
 
     /// For the only conversion of a process.
@@ -76,13 +71,13 @@ public:
     {
         if (HasExtension(m_kJob.source, ".orn"))
             return;
-        KeepUntilExit(m_kContent.SourceRoot());
-        KeepUntilExit(m_kContent.ResultMotion().motionRoot.Get());
+        KeepUntilExit(m_kConversion.SourceRoot());
+        KeepUntilExit(m_kConversion.Result().motionRoot.Get());
     }
 
     EConversion Run()
     {
-        if (!Open() || !SelectProfile() || !MayConvert() || !MayFit())
+        if (!m_kConversion.Open(m_kJob.source) || !SelectProfile() || !m_kConversion.HasFrames() || !MayFit())
             return EConversion::Failed;
         if (m_kOptions.dryRun)
             return EConversion::Planned;
@@ -91,7 +86,7 @@ public:
         // Another run may have made it meanwhile, such as the workers of one that was killed.
         if (m_kOptions.skipExisting && IsTaken(m_kJob.output))
             return EConversion::Skipped;
-        if (!Save())
+        if (!m_kConversion.WriteResult(m_kJob.output) || m_kReports.HasFailed())
             return EConversion::Failed;
         if (IsMeasured())
             Check();
@@ -99,82 +94,62 @@ public:
     }
 
 private:
-    bool Open() { return m_kContent.OpenSource() != 0 && !m_kWindow.HasFailed(); }
     bool SelectProfile();
-    bool MayConvert();
     bool Convert();
-    bool Save() { return m_kContent.SaveResult() != 0 && !m_kWindow.HasFailed(); }
     // A later run with --resume may have a report.
     bool IsMeasured() const
     {
         return m_kOptions.check || m_pkPart || !m_kOptions.report.empty() || m_kOptions.resume;
     }
     void Check();
-    void KeepMisfit();
-    bool RefuseEmpty();
     bool MayFit();
 
     const COptions& m_kOptions;
     const CConversionJob& m_kJob;
-    CShellWindow& m_kWindow;
+    CShellReports& m_kReports;
     Account& m_kAccount;
     CPagePart* m_pkPart; // null where no page is asked for
-    CFilePlatform m_kPlatform;
-    CShellContent m_kContent;
+    CShellConversion m_kConversion;
 };
 
-bool CConversion::SelectProfile()
+bool CJobSteps::SelectProfile()
 {
-    const bool selected = m_kOptions.profile.empty()
-                              ? m_kContent.SelectFittingProfile(m_kJob.source, m_kAccount.misfit)
-                              : m_kContent.SelectProfile(m_kOptions.profile);
-    if (!selected)
-        return false;
-    m_kContent.Profile()->GetProfileName(m_kAccount.profile);
-    m_kAccount.chosen = m_kContent.Chosen();
-    m_kAccount.profilePath = m_kContent.ToldProfilePath();
-    return true;
+    const bool selected = m_kConversion.SelectProfile();
+    m_kAccount.misfit = m_kConversion.Nearest();
+    m_kAccount.profile = m_kConversion.Profile().name;
+    m_kAccount.chosen = m_kConversion.Chosen();
+    m_kAccount.profilePath = m_kConversion.ProfilePath();
+    return selected;
 }
 
-// The state of the window's button is the rule. Source, target and profile are there, so that only keys can
-// lack.
-bool CConversion::MayConvert()
+bool CJobSteps::MayFit()
 {
-    return m_kWindow.IsEnabled("convert") || RefuseEmpty();
-}
-
-bool CConversion::RefuseEmpty()
-{
-    m_kWindow.Report(
-        ShellFailure(m_kJob.source, "no-frames", "the motion has no frames, so there is nothing to convert"));
-    return false;
-}
-
-bool CConversion::MayFit()
-{
-    const std::optional<CReport> refusal = WhyTooLarge(m_kContent, m_kJob);
+    const std::optional<CReport> refusal = WhyTooLarge(m_kConversion, m_kJob);
     if (refusal)
-        m_kWindow.Report(*refusal);
+        m_kReports.Add(*refusal);
     return !refusal;
 }
 
-bool CConversion::Convert()
+bool CJobSteps::Convert()
 {
-    if (m_kContent.ConvertMotion() == 0)
+    if (!m_kConversion.Convert(!m_kOptions.noLegs))
     {
-        KeepMisfit();
+        CProfileFit fit;
+        if (!m_kConversion.IsAdapted() && m_kConversion.Measure(m_kConversion.ProfilePath(), fit) &&
+            !fit.missing.empty())
+            m_kAccount.misfit = fit;
         return false;
     }
-    if (m_kWindow.HasFailed())
+    if (m_kReports.HasFailed())
         return false;
-    m_kAccount.frames = m_kContent.ResultMotion().GetKeyCount();
-    return m_kAccount.frames > 0 || RefuseEmpty(); // a container may say that it ends before it begins
+    m_kAccount.frames = m_kConversion.Result().GetKeyCount();
+    return m_kConversion.HasFrames();
 }
 
 // The result is saved: a measuring poses both trees.
-void CConversion::Check()
+void CJobSteps::Check()
 {
-    ConvertedMotion motion = MotionOf(m_kContent, m_kJob);
+    ConvertedMotion motion = MotionOf(m_kConversion, m_kJob);
     m_kAccount.check = MeasureMotion(motion, m_kAccount.profilePath);
     if (!m_kAccount.check)
         return;
@@ -187,28 +162,21 @@ void CConversion::Check()
         m_pkPart->Show(motion);
 }
 
-void CConversion::KeepMisfit()
-{
-    CProfileFit fit;
-    if (m_kContent.Measure(m_kContent.ProfilePath(), fit) && !fit.missing.empty())
-        m_kAccount.misfit = fit;
-}
-
-EConversion Decide(const COptions& options, const CConversionJob& job, CShellWindow& window, Account& account,
-                   CPagePart* part, EProcess process)
+EConversion Decide(const COptions& options, const CConversionJob& job, CShellReports& reports,
+                   Account& account, CPagePart* part, EProcess process)
 {
     if (options.skipExisting && IsTaken(job.output))
         return EConversion::Skipped;
     const std::optional<CReport> refusal = WhyNotWrite(options, job.output);
     if (refusal)
     {
-        window.Report(*refusal);
+        reports.Add(*refusal);
         return EConversion::Failed;
     }
-    CConversion conversion(options, job, window, account, part);
-    const EConversion outcome = conversion.Run();
+    CJobSteps steps(options, job, reports, account, part);
+    const EConversion outcome = steps.Run();
     if (process == EProcess::Ends)
-        conversion.KeepMotionsUntilExit();
+        steps.KeepMotionsUntilExit();
     return outcome;
 }
 
@@ -254,7 +222,7 @@ void Print(const CConversionJob& job, const Account& account)
 }
 
 void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& job, const Account& account,
-               const CShellWindow& window)
+               const CShellReports& reports)
 {
     CJsonWriter json(file);
     json.BeginObject();
@@ -266,7 +234,7 @@ void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& j
     json.Key("frames").Integer(account.frames);
     if (account.chosen)
         WriteVerdict(json, account.chosen->verdict);
-    WriteReports(json, window.Reports());
+    WriteReports(json, reports.All());
     if (account.misfit)
     {
         json.Key("fit").BeginObject();
@@ -282,12 +250,12 @@ void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& j
 }
 
 void Tell(const COptions& options, const CConversionJob& job, const Account& account,
-          const CShellWindow& window, std::FILE* record)
+          const CShellReports& reports, std::FILE* record)
 {
     if (record)
-        WriteJson(record, options, job, account, window);
+        WriteJson(record, options, job, account, reports);
     if (options.json)
-        WriteJson(stdout, options, job, account, window);
+        WriteJson(stdout, options, job, account, reports);
     if (options.json || options.quiet)
         return;
     Print(job, account);
@@ -305,18 +273,18 @@ const char* OutcomeName(EConversion outcome)
 EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process)
 {
-    CShellWindow window(options);
+    CShellReports reports(options);
     Account account;
-    account.outcome = Decide(options, job, window, account, part, process);
-    Tell(options, job, account, window, record);
+    account.outcome = Decide(options, job, reports, account, part, process);
+    Tell(options, job, account, reports, record);
     return account.outcome;
 }
 
 void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record)
 {
-    CShellWindow window(options);
-    window.Report(reason);
-    Tell(options, job, {}, window, record);
+    CShellReports reports(options);
+    reports.Add(reason);
+    Tell(options, job, {}, reports, record);
 }
 
 void TellSkipped(const COptions& options, const CConversionJob& job, const char* why)
@@ -324,7 +292,7 @@ void TellSkipped(const COptions& options, const CConversionJob& job, const char*
     Account account;
     account.outcome = EConversion::Skipped;
     account.whySkipped = why;
-    Tell(options, job, account, CShellWindow(options), nullptr);
+    Tell(options, job, account, CShellReports(options), nullptr);
 }
 
 } // namespace gw

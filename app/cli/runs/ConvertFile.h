@@ -38,9 +38,9 @@ enum class EProcess : uint8_t
 };
 
 /// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Tells the result
-/// on standard output and everything else on standard error. Each has a state machine of its own, so that
-/// nothing of one source stays for the next. A record, unless it is null, takes what --json tells and
-/// the key figures, and a part of a page the conversion's pictures and figures.
+/// on standard output and everything else on standard error. Nothing of one source stays for the next. A
+/// record, unless it is null, takes what --json tells and the key figures, and a part of a page the
+/// conversion's pictures and figures.
 EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process = EProcess::GoesOn);
 

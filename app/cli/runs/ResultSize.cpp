@@ -1,13 +1,11 @@
 #include "ResultSize.h"
 
-#include "CBoneMapProfile.h"
-#include "CKeyframeControl.h"
+#include "CFileConversion.h"
 #include "COrrinStream.h"
-#include "CShellContent.h"
 #include "ConvertFile.h"
 #include "Paths.h"
+#include "ResultFile.h"
 #include "Skeleton.h"
-#include "SourceTiming.h"
 #include "Words.h"
 
 #include <algorithm>
@@ -18,7 +16,6 @@ namespace gw {
 
 namespace {
 
-constexpr double kSavedRate = 120.0; // rows per second of a result, in terms of the profile's rate
 // Seven numbers of at least eight characters ("0.000000"), each behind a separator, and a line end.
 constexpr double kLeastRowBytes = 7 * 9 + 1;
 
@@ -33,14 +30,14 @@ double NumberBytes(double rowCount)
 
 } // namespace
 
-std::optional<CReport> WhyTooLarge(const CShellContent& content, const CConversionJob& job)
+std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const CConversionJob& job)
 {
-    const CKeyframeControl* const track = ConversionTrack(content.SourceRoot());
-    CNode* const skeleton = content.ResultMotion().restRoot.Get();
-    const int rate = content.Profile() ? content.Profile()->GetFrameRate() : 0;
-    if (!HasExtension(job.output, ".Kinetra") || !track || !skeleton || rate <= 0)
+    CNode* const skeleton = conversion.Result().restRoot.Get();
+    const int rate = conversion.Profile().frameRate;
+    if (!HasExtension(job.output, ".Kinetra") || !skeleton || rate <= 0)
         return std::nullopt;
-    const double frames = std::floor(std::max(static_cast<double>(track->m_fEndTime), -1.0)) + 1.0;
+    const double frames =
+        std::floor(std::max(static_cast<double>(conversion.Timing().lastFrame), -1.0)) + 1.0;
     const double rows = std::floor(frames * kSavedRate / rate);
     const auto bones = static_cast<double>(NodesOf(*skeleton).size());
     const double bytes = bones * (rows * kLeastRowBytes + NumberBytes(rows));

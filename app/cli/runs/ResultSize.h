@@ -6,11 +6,11 @@
 
 namespace gw {
 
-class CShellContent;
+class CFileConversion;
 struct CConversionJob;
 
 /// Why the result of a conversion cannot fit into its file, found before any work is done: a .Kinetra holds
 /// less than 2 GiB. Nothing for a result that may fit; the file itself counts then.
-std::optional<CReport> WhyTooLarge(const CShellContent& content, const CConversionJob& job);
+std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const CConversionJob& job);
 
 } // namespace gw

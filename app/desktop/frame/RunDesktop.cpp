@@ -26,7 +26,6 @@ namespace gw {
 namespace {
 
 constexpr const char* kSkinFolder = "Content";
-constexpr const char* kTargetFile = "base.htr";
 
 constexpr const char* kUsage = "Usage: GaitForge [FILE]\n"
                                "       GaitForge -s                        the map tool\n"

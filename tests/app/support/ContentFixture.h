@@ -39,11 +39,7 @@ public:
     std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
     void Report(const CReport& report) override;
-    void ShowBatchFile(size_t, size_t, const std::string& path) override
-    {
-        if (m_kOnBatchFile)
-            m_kOnBatchFile(path);
-    }
+    void StayPainted() override { m_kOnPaint(); }
     bool IsProgressDue() override { return m_bProgressDue; }
     void BeginWaitCursor() override { ++m_iWaits; }
     void EndWaitCursor() override { --m_iWaits; }
@@ -80,9 +76,8 @@ public:
     std::optional<CFolderChoice> m_kFolderAnswer;
     std::map<int, EAnswer> m_kAnswers; ///< by message; all others are answered with OK
     std::set<EKey> m_kKeys;
-    std::function<void(const std::string& path)>
-        m_kOnBatchFile;                     ///< what happens while a batch takes up a file
-    std::function<void()> m_kOnBox = [] {}; ///< what else happens while a message box is open
+    std::function<void()> m_kOnPaint = [] {}; ///< what happens in the midst of an operation
+    std::function<void()> m_kOnBox = [] {};   ///< what else happens while a message box is open
     std::function<void(bool shown)> m_kOnShowEditor = [](bool) {};
     std::function<void()> m_kOnRefreshEditor = [] {};
     std::function<bool(CBoneOffsetDialog& dialog)> m_kOnBoneOffset = [](CBoneOffsetDialog&) { return false; };

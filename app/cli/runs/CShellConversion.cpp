@@ -1,0 +1,208 @@
+#include "CShellConversion.h"
+
+#include "COptions.h"
+#include "CShellReports.h"
+#include "DoubtWords.h"
+#include "FailureWords.h"
+#include "FindBone.h"
+#include "Paths.h"
+#include "ProfileChoice.h"
+#include "ProfileFile.h"
+#include "ProfileFit.h"
+#include "StringTable.h"
+#include "Text.h"
+#include "Words.h"
+
+#include <algorithm>
+#include <array>
+#include <unordered_set>
+
+namespace gw {
+
+namespace {
+
+// The stock profiles of old, the one that is asked first.
+constexpr const char* kLongKnown[] = {"PoserBVH.prf", "MaxBVH.prf"};
+
+std::vector<std::string> NamesOf(const std::vector<CInstalledProfile>& profiles)
+{
+    std::vector<std::string> names;
+    names.reserve(profiles.size());
+    for (const CInstalledProfile& profile : profiles)
+        names.push_back(profile.name);
+    return names;
+}
+
+CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfile>& profiles)
+{
+    const std::string nearest = NearestName(name, NamesOf(profiles));
+    const std::string guess = nearest.empty() ? "" : "; did you mean " + Quoted(nearest) + '?';
+    return ShellFailure({}, "not-installed",
+                        "profile " + Quoted(name) + " is not installed" + guess +
+                            " ('gaitwright profiles' lists them)");
+}
+
+} // namespace
+
+CShellConversion::CShellConversion(const COptions& options, const ConversionChoices& choices,
+                                   CShellReports& reports)
+    : CFileConversion(options.dataFolder, choices, [&](const CReport& report) { reports.Add(report); }),
+      m_kOptions(options), m_kReports(reports)
+{
+}
+
+bool CShellConversion::Open(const std::string& path)
+{
+    if (!LoadSource(path) || !LoadTarget())
+        return false;
+    if (m_kOptions.profile.empty())
+        PickStockProfile();
+    return !m_kReports.HasFailed();
+}
+
+// The first stock profile that fits.
+void CShellConversion::PickStockProfile()
+{
+    const CBoneNames sources(SourceRoot());
+    const CBoneNames targets(Result().motionRoot.Get());
+    for (const char* file : kLongKnown)
+    {
+        ProfileRows stock;
+        const bool isRead = ReadProfileRows(DataFile(file), stock);
+        const RowMatch match = ApplyRows(stock.rows, sources, targets, nullptr);
+        const bool fits = isRead && match.foundCount == match.rowCount && match.mappedCount > 0;
+        if (const std::string path = fits ? FindProfile(stock.name) : ""; !path.empty())
+        {
+            UseProfile(path);
+            return;
+        }
+    }
+}
+
+std::string CShellConversion::FindProfile(const std::string& name)
+{
+    const auto has = [&](const CInstalledProfile& profile) { return EqualNoCase(profile.name, name); };
+    const auto found = std::ranges::find_if(InstalledProfiles(), has);
+    return found == m_kInstalled->end() ? std::string() : found->path;
+}
+
+const std::vector<CInstalledProfile>& CShellConversion::InstalledProfiles()
+{
+    if (!m_kInstalled)
+    {
+        m_kInstalled.emplace();
+        ReadInstalled(DataFile({}), true);
+        ReadInstalled(CustomProfileFolder(Platform(), Message(kCustomFolderKeyMessage)), false);
+    }
+    return *m_kInstalled;
+}
+
+// Each name once, with the first profile of that name.
+void CShellConversion::ReadInstalled(const std::string& folder, bool stock)
+{
+    std::unordered_set<std::string> names;
+    for (const CInstalledProfile& profile : *m_kInstalled)
+        names.insert(LowerCase(profile.name));
+    for (const CProfileTexts::Entry& entry : m_kTexts.emplace_back(folder).Entries())
+    {
+        if (names.insert(LowerCase(entry.name)).second)
+            m_kInstalled->push_back({entry.name, folder + entry.file, stock, entry.text});
+    }
+}
+
+std::string CShellConversion::ResolveProfile(const std::string& nameOrFile)
+{
+    std::string text;
+    const bool isFile = HasExtension(nameOrFile, ".prf") && ReadProfileText(nameOrFile, text);
+    std::string installed = isFile ? nameOrFile : FindProfile(nameOrFile);
+    if (!installed.empty())
+        return installed;
+    if (ReadProfileText(nameOrFile, text))
+        return nameOrFile;
+    if (HasExtension(nameOrFile, ".prf") || FileExists(nameOrFile))
+        Report(MakeReport(nameOrFile, EMisfit::BadProfile));
+    else
+        Report(NotInstalled(nameOrFile, InstalledProfiles()));
+    return {};
+}
+
+bool CShellConversion::SelectProfile()
+{
+    if (!m_kOptions.profile.empty())
+    {
+        const std::string path = ResolveProfile(m_kOptions.profile);
+        return !path.empty() && UseProfile(path);
+    }
+    if (ProfilePath().empty())
+        return SelectFitting();
+    WarnOfStockPick();
+    return true;
+}
+
+std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
+{
+    std::vector<LoadedProfile> profiles;
+    for (const CInstalledProfile& profile : InstalledProfiles())
+    {
+        if (profile.text)
+            profiles.push_back({profile.path, *profile.text});
+    }
+    // Where nothing fits at all, what is told of is a profile that animators know.
+    const auto rank =
+        [known = std::array{DataFile(kLongKnown[0]), DataFile(kLongKnown[1])}](const LoadedProfile& profile) {
+            return std::ranges::find(known, profile.path) - known.begin();
+        };
+    std::ranges::stable_sort(profiles, {}, rank);
+    std::vector<ProfileChoice> choices =
+        ChooseProfile(std::span<const LoadedProfile>(profiles), *SourceRoot(), *Result().motionRoot, judged);
+    const auto pick = std::ranges::find(choices, ProfilePath(), &ProfileChoice::path);
+    if (pick != choices.end())
+        std::rotate(choices.begin(), pick, pick + 1);
+    return choices;
+}
+
+bool CShellConversion::SelectFitting()
+{
+    const std::vector<ProfileChoice> choices = Choices(EJudged::First);
+    if (!choices.empty() && choices.front().match.IsWhole())
+        return Take(choices.front());
+    m_kNearest.emplace();
+    if (!choices.empty())
+        Measure(choices.front().path, *m_kNearest);
+    Report(NoneFitsReport(SourcePath(), *m_kNearest));
+    return false;
+}
+
+// A stock profile has always been taken where its rows fit: what speaks against it is a warning.
+void CShellConversion::WarnOfStockPick() const
+{
+    const std::string path[] = {ProfilePath()};
+    for (ProfileChoice& choice : ChooseProfile(path, *SourceRoot(), *Result().motionRoot))
+    {
+        std::erase_if(choice.verdict.doubts,
+                      [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
+        for (const CReport& warning : DoubtWarnings(SourcePath(), choice))
+            Report(warning);
+    }
+}
+
+bool CShellConversion::Take(const ProfileChoice& choice)
+{
+    if (choice.verdict.sureness == ESureness::Doubtful)
+    {
+        Report(DoubtfulReport(SourcePath(), choice));
+        return false;
+    }
+    for (const CReport& warning : DoubtWarnings(SourcePath(), choice))
+        Report(warning);
+    m_kChosen = choice;
+    UseProfile(choice.path, choice.profile);
+    return true;
+}
+
+bool CShellConversion::Measure(const std::string& profilePath, CProfileFit& fit) const
+{
+    return MeasureFit(profilePath, SourceRoot(), Result().motionRoot.Get(), fit);
+}
+
+} // namespace gw

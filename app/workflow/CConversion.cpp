@@ -1,0 +1,202 @@
+// From a source and the tables that a profile has filled to the target's motion.
+
+#include "CConversion.h"
+
+#include "AimBones.h"
+#include "AlignMotion.h"
+#include "BodyOfTable.h"
+#include "CKeyframeControl.h"
+#include "CMapRowTable.h"
+#include "CMotionFile.h"
+#include "CRetargeter.h"
+#include "CompleteBody.h"
+#include "FailureWords.h"
+#include "FindBone.h"
+#include "FitWords.h"
+#include "HostBones.h"
+#include "Mat4.h"
+#include "ProfileFit.h"
+#include "RestMisfits.h"
+#include "Skeleton.h"
+
+#include <algorithm>
+#include <cmath>
+#include <span>
+
+namespace gw {
+
+namespace {
+
+// Rows divided by their lengths and multiplied by them again, as results have always been made; a row of
+// length 0 is left alone.
+void RebuildRows(Mat4& matrix)
+{
+    const Vec3 lengths = RowLengths(matrix);
+    const float length[] = {lengths.x, lengths.y, lengths.z};
+    for (size_t row = 0; row < 3; ++row)
+    {
+        const std::span<float, 4> element = std::span(matrix.m).subspan(4 * row).first<4>();
+        for (size_t column = 0; column < 3 && length[row] != 0.0f; ++column)
+            element[column] = element[column] / length[row] * length[row];
+        element[3] = 0.0f;
+    }
+}
+
+// An aligned copy takes as many keys as the source's tracks hold; a container can name any end time without
+// a byte behind it.
+constexpr size_t kAnyKeyCount = size_t{1} << 22;
+
+size_t KeysHeld(const std::vector<CNode*>& joints)
+{
+    size_t keys = 0;
+    for (const CNode* joint : joints)
+    {
+        if (const auto* track = RecordCast<CKeyframeControl>(joint->GetControl()))
+            keys += std::max(
+                {track->m_kKeyTimes.size(), track->m_kRotationKeys.size(), track->m_kRotationTimes.size()});
+    }
+    return keys;
+}
+
+// The number of frames; 0, with the failure recorded, where they are more than the source can have.
+int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
+{
+    const std::vector<CNode*> joints = NodesOf(root);
+    const double most = static_cast<double>(std::max(KeysHeld(joints), kAnyKeyCount));
+    const double frames = std::floor(static_cast<double>(timing.lastFrame)) + 1.0;
+    if (frames >= 0.0 && frames * static_cast<double>(joints.size()) <= most)
+        return static_cast<int>(frames);
+    record.Fail(EFailure::TooLarge);
+    return 0;
+}
+
+// Whether an alignment mends what a reader warns of.
+bool IsAligned(EFailure reason)
+{
+    return reason == EFailure::RestPose || reason == EFailure::DoubledOffsets;
+}
+
+} // namespace
+
+void ReportRecord(const std::string& path, const CFailureRecord& record, const ConversionChoices& choices,
+                  const ReportListener& listener)
+{
+    if (record.Failure())
+        listener(MakeReport(path, record.Failure(), false));
+    for (const CFailure& warning : record.Warnings())
+    {
+        if (!choices.align || !IsAligned(warning.reason))
+            listener(MakeReport(path, warning, true));
+    }
+}
+
+bool CConversion::Prepare(bool doRowsFit, EAlignedJoints joints)
+{
+    const CFailure& shares = retargeter_.Record().Failure(); // all that can have failed up to here
+    if (shares)
+    {
+        ReportRecord(shares.name, retargeter_.Record(), input_.choices, report_);
+        return false;
+    }
+    if (!doRowsFit || !retargeter_.SourceOf(FindBone(target_.motionRoot.Get(), kRootBone)))
+    {
+        ReportMisfit();
+        return false;
+    }
+    if (input_.choices.align)
+        return Align(joints);
+    ReportTurnedAtRest();
+    return true;
+}
+
+bool CConversion::Align(EAlignedJoints joints)
+{
+    CNode& target = *target_.motionRoot;
+    CFailureRecord record;
+    BodyMotion source{input_.source, input_.timing.frequency, FramesOf(input_.timing, *input_.source, record),
+                      BodyOfTable(retargeter_, CNodeNames(target))};
+    ReportRecord(input_.sourcePath, record, input_.choices, report_);
+    CompleteBody(source.body);
+    Alignment alignment;
+    if (record.Failure())
+        return false;
+    if (!PlanAlignment(source, alignment))
+    {
+        report_(MakeReport(input_.sourcePath, EMisfit::NoBody));
+        return false;
+    }
+    const AlignedMotion aligned = AlignMotion(source, alignment, joints);
+    AimBones(retargeter_, target, source, alignment, aligned);
+    aligned_ = aligned.root;
+    alignment_ = std::move(alignment.report);
+    return true;
+}
+
+void CConversion::Run(bool useLegs, const std::function<void(size_t, size_t)>& progress)
+{
+    retargeter_.SetFaithful(input_.choices.faithful);
+    retargeter_.SetProgress(progress);
+    retargeter_.Retarget(0.0f, input_.timing.lastFrame, 0.0f, input_.timing.frequency, kRootPosition, true,
+                         useLegs);
+    ReportRecord(input_.sourcePath, retargeter_.Record(), input_.choices, report_);
+    NormalizeBasePose();
+}
+
+// Puts the rest pose's root where the motion's root begins; rotation and scale stay.
+void CConversion::NormalizeBasePose()
+{
+    CNode* const root = FindBone(target_.restRoot.Get(), kRootBone);
+    if (!root)
+        return;
+    RebuildRows(root->m_kMatrix);
+    root->m_kMatrix.SetTranslation(kRootPosition);
+    root->m_kMatrix.m[15] = 1.0f;
+}
+
+void CConversion::ReportMisfit()
+{
+    EMisfit misfit = EMisfit::NoRootSource;
+    if (!input_.source || !target_.motionRoot)
+        misfit = EMisfit::NoScene;
+    else if (input_.profilePath.empty())
+        misfit = EMisfit::NoProfile;
+    else if (ReportMissingBones())
+        return;
+    else if (input_.rows.FindTarget(kRootBone) == CMapRowTable::kNone)
+        misfit = EMisfit::NoRootRow;
+    report_(MakeReport(input_.profilePath, misfit));
+}
+
+// Reports the rows that name bones which are not there; false when there is none. A profile that lies in its
+// file as it is tells the lines.
+bool CConversion::ReportMissingBones()
+{
+    CNode* const target = target_.motionRoot.Get();
+    CProfileFit fit;
+    if (input_.areRowsEdited || !MeasureFit(input_.profilePath, input_.source, target, fit))
+    {
+        fit = MeasureFit(input_.rows, input_.source, target);
+        fit.name = input_.profileName;
+    }
+    if (!fit.missing.empty())
+        report_(MisfitReport(input_.sourcePath, fit));
+    return !fit.missing.empty();
+}
+
+// Rows that turn limbs at rest were made for another rest pose, or for none. Of a rest pose that is no
+// T-pose the file's reader has warned already.
+void CConversion::ReportTurnedAtRest()
+{
+    const auto isRestPose = [](const CFailure& warning) { return warning.reason == EFailure::RestPose; };
+    if (std::ranges::any_of(input_.sourceRecord.Warnings(), isRestPose))
+        return;
+    const std::vector<RestMisfit> misfits = FindRestMisfits(retargeter_, *target_.motionRoot);
+    const auto worst = std::ranges::max_element(misfits, {}, &RestMisfit::degrees);
+    if (worst == misfits.end())
+        return;
+    CReport report = MakeReport(input_.sourcePath, EMisfit::TurnedAtRest, worst->source);
+    report.warning = true;
+    report_(report);
+}
+
+} // namespace gw

@@ -1,0 +1,190 @@
+#include "CFileConversion.h"
+
+#include "AlignMotion.h"
+#include "AttachBoneMeshes.h"
+#include "CProfileFields.h"
+#include "CResourceManager.h"
+#include "FailureWords.h"
+#include "FindBone.h"
+#include "Paths.h"
+#include "ProfileFile.h"
+#include "ResultFile.h"
+#include "StringTable.h"
+#include "TKBVHStream.h"
+
+#include <algorithm>
+#include <array>
+
+namespace gw {
+
+CFileConversion::CFileConversion(const std::string& dataFolder, const ConversionChoices& choices,
+                                 ReportListener listener)
+    : platform_(EPlatformWriting::No, dataFolder), choices_(choices), report_(std::move(listener))
+{
+}
+
+std::string CFileConversion::Message(int id) const
+{
+    CResourceManager resources;
+    resources.OpenLibrary(DataFile(kResourceLibrary), platform_.ThreadLocale());
+    std::string text;
+    resources.LoadResString(id, text);
+    return text;
+}
+
+void CFileConversion::TellMessage(int id) const
+{
+    Report({false, {}, 0, kFixedMessage, {}, Message(id)});
+}
+
+bool CFileConversion::LoadSource(const std::string& path)
+{
+    sourcePath_ = path;
+    isScene_ = HasExtension(path, kSceneExtension);
+    const bool loaded = isScene_ ? LoadSourceScene(path, scene_, sourceRecord_) : motion_.Load(path);
+    if (!isScene_)
+        sourceRecord_ = motion_.Record();
+    else if (loaded)
+        AttachBoneMeshes(SourceRoot()); // which tell how the bones point, as those of motion files do
+    Report(path, sourceRecord_);
+    if (!loaded)
+        TellMessage(kInvalidSourceMessage);
+    return loaded;
+}
+
+CNode* CFileConversion::SourceRoot() const
+{
+    return isScene_ ? FirstNode(scene_.GetRoot(0)) : motion_.motionRoot.Get();
+}
+
+SourceTiming CFileConversion::Timing() const
+{
+    return isScene_ ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(motion_);
+}
+
+bool CFileConversion::LoadTarget()
+{
+    const std::string path = DataFile(kTargetFile);
+    const bool loaded = result_.Load(path);
+    Report(path, result_.Record());
+    return loaded;
+}
+
+bool CFileConversion::UseProfile(const std::string& path)
+{
+    ProfileRows profile;
+    const bool isRead = ReadProfileRows(path, profile);
+    if (isRead)
+        UseProfile(path, profile);
+    else
+        Report(MakeReport(path, EMisfit::BadProfile));
+    return isRead;
+}
+
+void CFileConversion::UseProfile(const std::string& path, const ProfileRows& profile)
+{
+    profile_ = profile;
+    profilePath_ = path;
+}
+
+// A container may say that it ends before it begins.
+bool CFileConversion::HasFrames() const
+{
+    const bool hasFrames = (isScene_ || motion_.GetKeyCount() > 0) && result_.GetKeyCount() > 0;
+    if (!hasFrames)
+        Report(MakeReport(sourcePath_, EMisfit::NoFrames));
+    return hasFrames;
+}
+
+// A number outside its limits counts all the same.
+void CFileConversion::WarnOfNumbers() const
+{
+    const auto warn = [&](int number, int low, int high, size_t line, const std::string& name) {
+        if (number == std::clamp(number, low, high))
+            return;
+        const std::string limits[] = {std::to_string(low), std::to_string(high)};
+        const std::string words = FormatText(Message(kNumberLimitsMessage), limits);
+        Report({true, profilePath_, line, "out-of-range", name, '"' + name + "\": " + words});
+    };
+    const auto& [x, y, z] = profile_.position;
+    const std::array place{CutToInteger(x), CutToInteger(y), CutToInteger(z)};
+    std::string name = "Position";
+    for (const int number : place)
+        name += ' ' + std::to_string(number);
+    for (const int number : place)
+        warn(number, -kOffsetLimit, kOffsetLimit, profile_.positionLine, name);
+    warn(profile_.frameRate, kLowestFrameRate, kHighestFrameRate, profile_.frameRateLine,
+         "FrameRate " + std::to_string(profile_.frameRate));
+}
+
+// Fills a new retargeter's tables from the profile.
+bool CFileConversion::Prepare(EAlignedJoints joints)
+{
+    CNode* const source = SourceRoot();
+    CNode* const target = result_.motionRoot.Get();
+    CRetargeter& retargeter = retargeter_.emplace();
+    bool fits = source && target;
+    if (fits)
+    {
+        WarnOfNumbers();
+        retargeter.SetScenes(source, target);
+        const RowMatch match = ApplyRows(profile_.rows, CBoneNames(source), CBoneNames(target), &retargeter);
+        fits = match.foundCount == match.rowCount;
+        retargeter.LoadShares(DataFile(kShareFile));
+    }
+    conversion_.emplace(ConversionInput{.sourcePath = sourcePath_,
+                                        .source = source,
+                                        .timing = Timing(),
+                                        .sourceRecord = sourceRecord_,
+                                        .profilePath = profilePath_,
+                                        .profileName = profile_.name,
+                                        .rows = profile_.rows,
+                                        .choices = choices_},
+                        result_, retargeter, report_);
+    return conversion_->Prepare(fits, joints);
+}
+
+bool CFileConversion::Convert(bool useLegs)
+{
+    if (!Prepare(EAlignedJoints::Body))
+    {
+        TellMessage(kCannotConvertMessage);
+        return false;
+    }
+    conversion_->Run(useLegs);
+    return true;
+}
+
+bool CFileConversion::WriteResult(const std::string& path)
+{
+    CFailureRecord record;
+    const bool written = WriteResultFile(result_, path, profile_.frameRate, record);
+    Report(path, record);
+    return written;
+}
+
+bool CFileConversion::WriteBatchResult(const std::string& path)
+{
+    CFailureRecord record;
+    const bool written = WriteMotionFile(result_, path, kBatchRate, profile_.frameRate, record);
+    Report(sourcePath_, record);
+    return written;
+}
+
+bool CFileConversion::WriteAligned(const std::string& path)
+{
+    if (!Prepare(EAlignedJoints::All))
+        return false;
+    TKBVHStream stream;
+    stream.motionRoot = conversion_->Aligned();
+    const bool written = stream.WriteExact(path);
+    Report(path, stream.Record());
+    return written;
+}
+
+CNode* CFileConversion::DrivingRoot() const
+{
+    return conversion_ && conversion_->Aligned() ? conversion_->Aligned() : SourceRoot();
+}
+
+} // namespace gw

@@ -1,0 +1,84 @@
+// From the target's motion to a file: a Kinetra package around an HTR, or the HTR alone.
+
+#include "ResultFile.h"
+
+#include "CMotionFile.h"
+#include "CPackageFile.h"
+#include "Packaging.h"
+#include "Paths.h"
+
+#include <functional>
+
+namespace gw {
+
+namespace {
+
+constexpr std::string_view kPackageExtension = ".Kinetra";
+constexpr std::string_view kMotionExtension = ".htr";
+// The host plays packages at this rate: a result is stored in half-steps of it.
+constexpr float kHostRate = 60.0f;
+
+// Saves the result with as many times more frames as a rate stands above the profile's.
+bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
+                const std::function<bool(float frameScale)>& save, CFailureRecord& record)
+{
+    if (profileRate <= 0)
+        return record.Fail(EFailure::BadNumber, 0, "FrameRate " + std::to_string(profileRate));
+    const bool saved = save(rate / static_cast<float>(profileRate));
+    const CFailure& failure = result.Record().Failure();
+    return saved || record.Fail(failure.reason, failure.where, failure.name);
+}
+
+// The motion's text goes straight into the package, so that an HTR beside the chosen name stays as it is.
+bool WritePackage(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
+{
+    CPackageFile package;
+    const auto append = [&](std::span<const std::byte> bytes) {
+        return package.Write(bytes) || record.Fail(package.Failure());
+    };
+    const auto write = [&](float frameScale) { return result.SaveText(append, frameScale); };
+    if (!package.Open(
+            path, {FormatCode(std::string(kMotionExtension)), static_cast<float>(profileRate), kHostRate}))
+        return record.Fail(package.Failure());
+    return SaveMotion(result, kSavedRate, profileRate, write, record) &&
+           (package.Commit() || record.Fail(package.Failure()));
+}
+
+} // namespace
+
+bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
+{
+    if (HasExtension(path, kPackageExtension))
+        return WritePackage(result, path, profileRate, record);
+    return WriteMotionFile(result, WithExtension(path, kMotionExtension), kSavedRate, profileRate, record);
+}
+
+bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, int profileRate,
+                     CFailureRecord& record)
+{
+    const auto write = [&](float frameScale) { return result.Save(path, frameScale); };
+    return SaveMotion(result, rate, profileRate, write, record);
+}
+
+bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record)
+{
+    return PackageMotion(path, output, kHostRate, kHostRate, record);
+}
+
+std::string WithExtension(const std::string& path, std::string_view extension)
+{
+    const CPathParts parts = SplitPath(path);
+    return parts.folder + parts.stem + std::string(extension);
+}
+
+std::string_view BatchSource(EBatchJob job)
+{
+    return job == EBatchJob::ToMotion ? ".bvh" : ".htr";
+}
+
+std::string_view BatchResult(EBatchJob job)
+{
+    return job == EBatchJob::ToMotion ? ".htr" : ".orn";
+}
+
+} // namespace gw
