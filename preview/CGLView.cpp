@@ -104,8 +104,8 @@ void CGLView::GoTo(float time)
 
 void CGLView::Repaint()
 {
-    if (m_kRepaint)
-        m_kRepaint();
+    if (repaint_)
+        repaint_();
 }
 
 void CGLView::MouseDown(int x, int y)

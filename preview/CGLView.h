@@ -50,7 +50,7 @@ public:
     void Repaint() override;
 
     /// What Repaint calls; the window asks its toolkit there to be drawn soon.
-    void SetRepaint(std::function<void()> repaint) { m_kRepaint = std::move(repaint); }
+    void SetRepaint(std::function<void()> repaint) { repaint_ = std::move(repaint); }
     /// Camera and pan as SetScene would give them for the scene as it stands now.
     void FrameAll();
 
@@ -82,7 +82,7 @@ private:
     Ref<CNode> m_spkScene;
     CMeshList m_kMeshes;
     CDrawList m_kDrawList;
-    std::function<void()> m_kRepaint;
+    std::function<void()> repaint_;
     float m_fTime = 0.0f;
     float m_fFrameStep = 0.0f;
     float m_fLastFrame = 0.0f;

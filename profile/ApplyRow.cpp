@@ -19,13 +19,13 @@ enum class ERowFit : uint8_t
     Mapped,  // source and target are there
 };
 
-Vec3 Degrees(const CRowNumbers& numbers)
+Vec3 Degrees(const RowNumbers& numbers)
 {
     const auto& [x, y, z] = numbers.rotation;
     return {static_cast<float>(x), static_cast<float>(y), static_cast<float>(z)};
 }
 
-void SetMapping(CRetargeter& retargeter, CNode* target, CNode* source, const CRowNumbers& numbers)
+void SetMapping(CRetargeter& retargeter, CNode* target, CNode* source, const RowNumbers& numbers)
 {
     retargeter.SetSourceOf(target, source);
     const Vec3 degrees = Degrees(numbers);

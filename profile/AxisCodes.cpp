@@ -9,13 +9,13 @@ namespace gw {
 
 namespace {
 
-struct CAxisName
+struct AxisNameRow
 {
     int code;
     std::string_view text;
 };
 
-constexpr CAxisName kAxisNames[] = {
+constexpr AxisNameRow kAxisNames[] = {
     {1,  " X"},
     {-1, "-X"},
     {2,  " Y"},
@@ -28,14 +28,14 @@ constexpr CAxisName kAxisNames[] = {
 
 int AxisCodeOf(std::string_view text)
 {
-    const auto same = [=](const CAxisName& name) { return EqualNoCase(name.text, text); };
+    const auto same = [=](const AxisNameRow& name) { return EqualNoCase(name.text, text); };
     const auto* found = std::ranges::find_if(kAxisNames, same);
     return found == std::end(kAxisNames) ? 0 : found->code;
 }
 
 std::string_view AxisText(int code)
 {
-    const auto* found = std::ranges::find(kAxisNames, code, &CAxisName::code);
+    const auto* found = std::ranges::find(kAxisNames, code, &AxisNameRow::code);
     return found == std::end(kAxisNames) ? std::string_view() : found->text;
 }
 

@@ -18,7 +18,7 @@ constexpr std::array<std::array<size_t, 2>, 3> kOtherAxes{
 
 } // namespace
 
-CBoneOffsetDialog::CBoneOffsetDialog(const CRowNumbers& numbers) : m_kNumbers(numbers)
+CBoneOffsetDialog::CBoneOffsetDialog(const RowNumbers& numbers) : m_kNumbers(numbers)
 {
     for (size_t axis = 0; axis < m_kRotationText.size(); ++axis)
         m_kRotationText[axis] = std::to_string(numbers.rotation[axis]);

@@ -16,9 +16,9 @@ public:
     /// The entries of each axis box, in order.
     static constexpr std::array<std::string_view, 6> kAxisEntries{"X", "-X", "Y", "-Y", "Z", "-Z"};
 
-    explicit CBoneOffsetDialog(const CRowNumbers& numbers = {});
+    explicit CBoneOffsetDialog(const RowNumbers& numbers = {});
 
-    const CRowNumbers& Numbers() const { return m_kNumbers; }
+    const RowNumbers& Numbers() const { return m_kNumbers; }
 
     /// What a rotation field shows.
     const std::string& RotationText(int axis) const { return m_kRotationText[static_cast<size_t>(axis)]; }
@@ -33,7 +33,7 @@ public:
     void ChooseAxis(int axis, int entry);
 
 private:
-    CRowNumbers m_kNumbers;
+    RowNumbers m_kNumbers;
     std::array<std::string, 3> m_kRotationText;
 };
 

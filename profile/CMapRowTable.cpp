@@ -12,7 +12,7 @@ namespace {
 
 constexpr size_t kAxisCount = 3;
 
-void WriteRotation(CMapRowTable::Row& row, const CRowNumbers& numbers)
+void WriteRotation(CMapRowTable::Row& row, const RowNumbers& numbers)
 {
     for (size_t axis = 0; axis < kAxisCount; ++axis)
         row[kRotationColumn + axis] = std::to_string(numbers.rotation[axis]);
@@ -38,9 +38,9 @@ bool CMapRowTable::IsFixed(int row) const
     return EqualNoCase(Text(row, kSourceColumn), kFixedSource);
 }
 
-CRowNumbers CMapRowTable::Numbers(int row) const
+RowNumbers CMapRowTable::Numbers(int row) const
 {
-    CRowNumbers numbers;
+    RowNumbers numbers;
     for (int axis = 0; axis < static_cast<int>(kAxisCount); ++axis)
     {
         numbers.rotation[Index(axis)] = ParseInt(Text(row, kRotationColumn + axis));
@@ -65,7 +65,7 @@ void CMapRowTable::IndexTargets() const
         m_kRowOfTarget.emplace(LowerCase(Text(row, kTargetColumn)), row);
 }
 
-void CMapRowTable::AddRow(std::string_view source, std::string_view target, const CRowNumbers& numbers,
+void CMapRowTable::AddRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                           ERowColumns columns)
 {
     const int found = FindTarget(target);

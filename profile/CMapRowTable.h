@@ -22,7 +22,7 @@ enum EMapColumn : int
 };
 
 /// How a column is shown. Widths are shares of the table's width, divided as integers.
-struct CMapColumnTitle
+struct MapColumnTitle
 {
     int messageId; ///< 0 where the title is a blank
     bool alignRight;
@@ -31,7 +31,7 @@ struct CMapColumnTitle
 };
 
 /// The titles of the eight columns and of a ninth, empty one that fills the rest.
-inline constexpr CMapColumnTitle kMapColumnTitles[] = {
+inline constexpr MapColumnTitle kMapColumnTitles[] = {
     {149, false, 6, 25},
     {150, false, 6, 25},
     {151, true,  2, 25},
@@ -63,7 +63,7 @@ public:
     const std::string& Text(int row, int column) const;
     bool IsFixed(int row) const;
     /// Rotation and axes of a row as numbers. An empty axis is the neutral one.
-    CRowNumbers Numbers(int row) const;
+    RowNumbers Numbers(int row) const;
     /// The row of a target bone without regard to case, or kNone.
     int FindTarget(std::string_view target) const;
     /// Whether all texts are equal, whatever is selected.
@@ -71,7 +71,7 @@ public:
 
     /// Appends a row, or changes the one of the same target. A row's source never changes, and the row at
     /// index 0 keeps the rotation that it was added with.
-    void AddRow(std::string_view source, std::string_view target, const CRowNumbers& numbers,
+    void AddRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                 ERowColumns columns);
     /// Sees to it that each of the bones that no source drives has a row. New rows are fixed ones.
     void AddPelvisRows();

@@ -58,17 +58,17 @@ bool SelectedText(const CBoneTree& tree, std::string& name)
 class CProfileEditorDialog::CUserCommand
 {
 public:
-    explicit CUserCommand(CProfileEditorDialog& editor) : m_kEditor(editor), m_kBefore(editor.State()) {}
-    ~CUserCommand() { m_kEditor.m_kHistory.Keep(std::move(m_kBefore), m_kEditor.State()); }
+    explicit CUserCommand(CProfileEditorDialog& editor) : editor_(editor), m_kBefore(editor.State()) {}
+    ~CUserCommand() { editor_.m_kHistory.Keep(std::move(m_kBefore), editor_.State()); }
     CUserCommand(const CUserCommand&) = delete;
     CUserCommand& operator=(const CUserCommand&) = delete;
 
 private:
-    CProfileEditorDialog& m_kEditor;
+    CProfileEditorDialog& editor_;
     CProfileState m_kBefore;
 };
 
-CProfileEditorDialog::CProfileEditorDialog(CProfileOwner& owner) : m_kOwner(owner)
+CProfileEditorDialog::CProfileEditorDialog(CProfileOwner& owner) : owner_(owner)
 {
     m_kProfileName = "Untitled";
     ShowFields();
@@ -119,7 +119,7 @@ bool CProfileEditorDialog::HasRootMapping() const
 
 void CProfileEditorDialog::PromptSaveChanges()
 {
-    if (m_bDirty && m_kOwner.ShowMessage(kAskSaveChanges, EButtons::YesNo) == EAnswer::Yes)
+    if (m_bDirty && owner_.ShowMessage(kAskSaveChanges, EButtons::YesNo) == EAnswer::Yes)
         WriteProfile(EProfileWrite::Quiet);
     m_bDirty = false;
 }
@@ -140,7 +140,7 @@ bool CProfileEditorDialog::ApplyProfile(CRetargeter* retargeter, int* matched, i
             MarkRowBones(m_kRows.Text(row, kSourceColumn), m_kRows.Text(row, kTargetColumn), true);
         });
     if (retargeter)
-        retargeter->LoadShares(m_kOwner.ExeFile(kShareFile));
+        retargeter->LoadShares(owner_.ExeFile(kShareFile));
     StoreCounts(match.foundCount, match.rowCount, matched, total);
     return match.foundCount == match.rowCount;
 }
@@ -168,7 +168,7 @@ bool CProfileEditorDialog::ReadProfile(std::string path, int* matched, int* tota
     {
         ShowFields();
         ForcePelvisRows();
-        m_kOwner.ProfileSetChanged();
+        owner_.ProfileSetChanged();
     }
     m_kProfilePath = std::move(path);
     return fits;
@@ -182,7 +182,7 @@ bool CProfileEditorDialog::ReadLines(CProfileReader& reader, int* matched, int* 
     int found = 0;
     int rowCount = 0;
     bool fits = true;
-    CProfileLine line;
+    ProfileLine line;
     while (reader.Next(line))
     {
         if (mode == EProfileRead::Load)
@@ -201,7 +201,7 @@ bool CProfileEditorDialog::ReadLines(CProfileReader& reader, int* matched, int* 
     return fits;
 }
 
-void CProfileEditorDialog::LoadLine(const CProfileLine& line)
+void CProfileEditorDialog::LoadLine(const ProfileLine& line)
 {
     switch (line.kind)
     {
@@ -220,19 +220,19 @@ void CProfileEditorDialog::LoadLine(const CProfileLine& line)
 
 bool CProfileEditorDialog::WriteProfile(EProfileWrite mode)
 {
-    std::string path = m_kOwner.FindProfilePath(m_kProfileName);
+    std::string path = owner_.FindProfilePath(m_kProfileName);
     if (path.empty())
-        path = NewProfilePath(m_kOwner);
+        path = NewProfilePath(owner_);
     else if (mode == EProfileWrite::Ask &&
-             m_kOwner.ShowMessage(kAskOverwrite, EButtons::OKCancel) != EAnswer::OK)
+             owner_.ShowMessage(kAskOverwrite, EButtons::OKCancel) != EAnswer::OK)
         return false;
     m_kProfileName.resize(CutTrailing(m_kProfileName).size());
     const bool written = ReplaceFile(path, ProfileText(m_kProfileName, m_iFrameRate, m_kRootOffset, m_kRows));
-    m_kOwner.ShowMessage(written ? kSaved : kSaveFailed, EButtons::OK);
+    owner_.ShowMessage(written ? kSaved : kSaveFailed, EButtons::OK);
     if (written)
     {
         m_kHistory.ProfileSaved(m_kProfileName, path);
-        m_kOwner.ProfileSetChanged();
+        owner_.ProfileSetChanged();
     }
     m_bDirty = false;
     m_kProfilePath = std::move(path);
@@ -241,7 +241,7 @@ bool CProfileEditorDialog::WriteProfile(EProfileWrite mode)
 }
 
 bool CProfileEditorDialog::AddMapRow(std::string_view source, std::string_view target,
-                                     const CRowNumbers& numbers, ERowColumns columns)
+                                     const RowNumbers& numbers, ERowColumns columns)
 {
     m_kRows.AddRow(source, target, numbers, columns);
     return true;
@@ -301,7 +301,7 @@ bool CProfileEditorDialog::EditBoneOffset()
     if (row == CMapRowTable::kNone)
         return false;
     CBoneOffsetDialog dialog(m_kRows.Numbers(row));
-    if (!m_kOwner.RunBoneOffset(dialog) || row >= m_kRows.RowCount())
+    if (!owner_.RunBoneOffset(dialog) || row >= m_kRows.RowCount())
         return false;
     if (m_kRows.Numbers(row) == dialog.Numbers())
         return true;
@@ -331,8 +331,8 @@ void CProfileEditorDialog::CommitFields(EFieldCommit mode)
 
 void CProfileEditorDialog::CommitNumbers(EFieldCommit mode)
 {
-    const Vec3 rootOffset = m_kFields.ReadRootOffset(m_kOwner);
-    const int frameRate = m_kFields.ReadFrameRate(m_kOwner);
+    const Vec3 rootOffset = m_kFields.ReadRootOffset(owner_);
+    const int frameRate = m_kFields.ReadFrameRate(owner_);
     if (mode != EFieldCommit::Apply || (rootOffset == m_kRootOffset && frameRate == m_iFrameRate))
         return;
     m_kRootOffset = rootOffset;
@@ -349,7 +349,7 @@ void CProfileEditorDialog::CommitName(EFieldCommit mode)
         return;
     if (name.empty() || IsNameInUse(name, m_pkNamesInUse))
     {
-        m_kOwner.ShowMessage(kNameInvalid, EButtons::OK);
+        owner_.ShowMessage(kNameInvalid, EButtons::OK);
         m_kFields.Set(kNameField, m_kProfileName);
         m_bDirty = false; // also where earlier changes were pending
         return;
@@ -361,7 +361,7 @@ void CProfileEditorDialog::CommitName(EFieldCommit mode)
 void CProfileEditorDialog::SetDirty()
 {
     m_bDirty = true;
-    m_kOwner.ProfileSetChanged();
+    owner_.ProfileSetChanged();
 }
 
 void CProfileEditorDialog::MarkChanged()
@@ -376,7 +376,7 @@ void CProfileEditorDialog::MarkChanged()
 
 void CProfileEditorDialog::UpdateButtons()
 {
-    m_kOwner.ProfileStateChanged();
+    owner_.ProfileStateChanged();
     const int selected = m_kRows.SelectedCount();
     const int source = m_kSourceTree.Selected();
     const int target = m_kTargetTree.Selected();

@@ -14,7 +14,7 @@
 namespace gw {
 
 class CProfileReader;
-struct CProfileLine;
+struct ProfileLine;
 
 /// Controls of the profile editor beside its fields, with the numbers that they have always had.
 enum EProfileControl : int
@@ -30,7 +30,7 @@ enum EProfileControl : int
 };
 
 /// Which buttons of the profile editor take a click.
-struct CProfileButtons
+struct ProfileButtons
 {
     bool addToMap = false;
     bool remove = false;
@@ -87,7 +87,7 @@ public:
     const CBoneTree& TargetTree() const { return m_kTargetTree; }
     /// The text of the field with a control id; empty for other ids.
     const std::string& FieldText(int id) const { return m_kFields.Text(id); }
-    const CProfileButtons& Buttons() const { return m_kButtons; }
+    const ProfileButtons& Buttons() const { return m_kButtons; }
     bool IsDirty() const { return m_bDirty; }
     bool IsVisible() const { return m_bVisible; }
     const std::string& ProfilePath() const { return m_kProfilePath; }
@@ -123,7 +123,7 @@ public:
     bool WriteProfile(EProfileWrite mode);
 
     /// Always true. The row at index 0 keeps its rotation.
-    bool AddMapRow(std::string_view source, std::string_view target, const CRowNumbers& numbers,
+    bool AddMapRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                    ERowColumns columns = ERowColumns::All);
     void RemoveMapRow(int row);
     /// Sees to it that the two pelvis bones, which no source drives, have a row.
@@ -156,7 +156,7 @@ private:
     class CUserCommand;
 
     bool ReadLines(CProfileReader& reader, int* matched, int* total, EProfileRead mode);
-    void LoadLine(const CProfileLine& line);
+    void LoadLine(const ProfileLine& line);
     void MarkRowBones(std::string_view source, std::string_view target, bool mapped);
     void CommitNumbers(EFieldCommit mode);
     void CommitName(EFieldCommit mode);
@@ -165,13 +165,13 @@ private:
     void Restore(const CProfileState& state);
     void MarkAllRows(bool mapped);
 
-    CProfileOwner& m_kOwner;
+    CProfileOwner& owner_;
     const std::vector<std::string>* m_pkNamesInUse = nullptr;
     CMapRowTable m_kRows;
     CBoneTree m_kSourceTree{kMappedSourceImage};
     CBoneTree m_kTargetTree{kMappedTargetImage};
     CProfileFields m_kFields;
-    CProfileButtons m_kButtons;
+    ProfileButtons m_kButtons;
     CProfileHistory m_kHistory;
     bool m_bDirty = false;
     bool m_bVisible = false;

@@ -20,7 +20,7 @@ Vec3 ParseThree(std::string_view text)
     return {next(), next(), next()};
 }
 
-void ParseMapping(std::string_view text, CMapLine& line)
+void ParseMapping(std::string_view text, MapLine& line)
 {
     line.source = NextWord(text);
     NextWord(text); // the arrow
@@ -40,9 +40,9 @@ std::string ThreeText(const Vec3& numbers)
 
 } // namespace
 
-CMapLine ParseMapLine(std::string_view text)
+MapLine ParseMapLine(std::string_view text)
 {
-    CMapLine line;
+    MapLine line;
     line.text = text;
     const std::string lower = LowerCase(text);
     // What stands behind a keyword, wherever in the line it stands.
@@ -95,7 +95,7 @@ std::string MappingLine(std::string_view source, std::string_view target, const 
     return std::string(source).append(" <---> ").append(target).append(" ").append(ThreeText(degrees));
 }
 
-bool ReadMapLines(const std::string& path, std::vector<CMapLine>& lines)
+bool ReadMapLines(const std::string& path, std::vector<MapLine>& lines)
 {
     std::string text;
     if (!ReadProfileText(path, text))
@@ -108,10 +108,10 @@ bool ReadMapLines(const std::string& path, std::vector<CMapLine>& lines)
     return true;
 }
 
-bool WriteMapLines(const std::string& path, std::span<const CMapLine> lines)
+bool WriteMapLines(const std::string& path, std::span<const MapLine> lines)
 {
     std::string text;
-    for (const CMapLine& line : lines)
+    for (const MapLine& line : lines)
         text.append(line.text).append(kLineEnd);
     // What a first line begins with would be taken for the mark at the begin of a text, and be lost.
     if (SkipByteOrderMark(text).size() < text.size())

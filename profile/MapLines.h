@@ -22,7 +22,7 @@ enum class EMapLine : uint8_t
 
 /// One entry of the older map syntax: the line as it stands, and what it says. Only the members of its kind
 /// count.
-struct CMapLine
+struct MapLine
 {
     std::string text;
     EMapLine kind = EMapLine::Text;
@@ -34,7 +34,7 @@ struct CMapLine
 };
 
 /// Reads one line. Every text is a line of some kind.
-CMapLine ParseMapLine(std::string_view text);
+MapLine ParseMapLine(std::string_view text);
 
 // The lines as the map tool writes them. Numbers are cut to integers toward zero.
 std::string PositionLine(const Vec3& position);
@@ -44,8 +44,8 @@ std::string MappingLine(std::string_view source, std::string_view target);
 std::string MappingLine(std::string_view source, std::string_view target, const Vec3& degrees);
 
 /// Reads all lines of a map or profile file. False, and lines left alone, when it cannot be read.
-bool ReadMapLines(const std::string& path, std::vector<CMapLine>& lines);
+bool ReadMapLines(const std::string& path, std::vector<MapLine>& lines);
 /// Replaces a file by the lines' texts. False leaves an old file as it was.
-bool WriteMapLines(const std::string& path, std::span<const CMapLine> lines);
+bool WriteMapLines(const std::string& path, std::span<const MapLine> lines);
 
 } // namespace gw

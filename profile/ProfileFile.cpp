@@ -31,9 +31,9 @@ bool NextInList(std::string_view& rest, int& number)
 }
 
 // "rx,ry,rz,ax,ay,az", or ".ax,ay,az". Numbers that are not there keep their defaults.
-CRowNumbers ParseNumbers(std::string_view text)
+RowNumbers ParseNumbers(std::string_view text)
 {
-    CRowNumbers numbers;
+    RowNumbers numbers;
     auto& [rotation, axes] = numbers;
     const std::array<int*, 6> all{&rotation[0], &rotation[1], &rotation[2], &axes[0], &axes[1], &axes[2]};
     std::span<int* const> list = all;
@@ -137,7 +137,7 @@ void CProfileReader::TakeTokens(std::string_view piece)
     }
 }
 
-bool CProfileReader::Next(CProfileLine& line)
+bool CProfileReader::Next(ProfileLine& line)
 {
     std::string_view piece;
     if (!NextPiece(piece))

@@ -35,12 +35,12 @@ std::string ReadProfileName(const std::string& path);
 bool ReadProfileText(const std::string& path, std::string& text);
 
 /// What a row says beside its two names.
-struct CRowNumbers
+struct RowNumbers
 {
     std::array<int, 3> rotation{}; ///< X, Y, Z in degrees
     AxisCodes axes = kNeutralAxes;
 
-    friend bool operator==(const CRowNumbers&, const CRowNumbers&) = default;
+    friend bool operator==(const RowNumbers&, const RowNumbers&) = default;
 };
 
 enum class EProfileLine : uint8_t
@@ -52,7 +52,7 @@ enum class EProfileLine : uint8_t
 };
 
 /// One line of a profile behind the first. Only the members of its kind say something.
-struct CProfileLine
+struct ProfileLine
 {
     EProfileLine kind = EProfileLine::Mapping;
     size_t line = 0; ///< in the file, from 1 on
@@ -60,7 +60,7 @@ struct CProfileLine
     int frameRate = 0;
     std::string source; ///< kFixedSource in a fixed row
     std::string target;
-    CRowNumbers numbers;
+    RowNumbers numbers;
 };
 
 /// Reads the text of a profile line by line. Never fails: a line with too few tokens takes the missing ones
@@ -73,7 +73,7 @@ public:
 
     const std::string& Name() const { return m_kName; }
     /// False at the end of the file.
-    bool Next(CProfileLine& line);
+    bool Next(ProfileLine& line);
 
 private:
     static constexpr size_t kTokenCount = 4;

@@ -25,7 +25,7 @@ bool Has(const CBoneNames& bones, const std::string& name, ESkeletonSide side, i
 CMapRowTable ReadRows(CProfileReader& reader, std::vector<size_t>& lines)
 {
     CMapRowTable rows;
-    CProfileLine line;
+    ProfileLine line;
     while (reader.Next(line))
     {
         if (line.kind == EProfileLine::Fixed || line.kind == EProfileLine::Mapping)
@@ -68,7 +68,7 @@ bool MeasureFit(const std::string& path, CNode* sourceRoot, CNode* targetRoot, C
     std::vector<size_t> lines;
     fit = MeasureFit(ReadRows(reader, lines), sourceRoot, targetRoot);
     fit.name = reader.Name();
-    for (CMissingBone& bone : fit.missing)
+    for (MissingBone& bone : fit.missing)
         bone.line = lines[static_cast<size_t>(bone.row)];
     return true;
 }

@@ -17,7 +17,7 @@ enum class ESkeletonSide : uint8_t
 };
 
 /// A bone that a row of a profile names and that its skeleton does not have.
-struct CMissingBone
+struct MissingBone
 {
     ESkeletonSide side = ESkeletonSide::Source;
     std::string name;
@@ -34,7 +34,7 @@ struct CProfileFit
     int rowCount = 0;        ///< one for each target bone, fixed ones included
     int foundCount = 0;      ///< rows whose bones are there
     bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
-    std::vector<CMissingBone> missing;
+    std::vector<MissingBone> missing;
 
     /// Whether a conversion accepts the profile.
     bool IsWhole() const { return foundCount == rowCount && drivesRoot; }

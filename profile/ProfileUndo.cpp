@@ -34,7 +34,7 @@ void CProfileEditorDialog::Restore(const CProfileState& state)
     m_iFrameRate = state.frameRate;
     m_bDirty = state.dirty;
     ShowFields();
-    m_kOwner.ProfileSetChanged();
+    owner_.ProfileSetChanged();
     UpdateButtons();
 }
 

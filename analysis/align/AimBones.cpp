@@ -37,19 +37,18 @@ private:
     void TakePelvis();
     void SetRow(const Row& row);
 
-    CRetargeter& m_kTable;
-    CNode& m_kTargetRoot;
-    const BodyMotion& m_kSource;
-    const AlignedMotion& m_kAligned;
+    CRetargeter& table_;
+    CNode& targetRoot_;
+    const BodyMotion& source_;
+    const AlignedMotion& aligned_;
     std::vector<Row> m_kRows;
     std::unordered_map<const CNode*, size_t> m_kIndex;
-    const Alignment& m_kAlignment;
+    const Alignment& alignment_;
 };
 
 CBoneAimer::CBoneAimer(CRetargeter& table, CNode& targetRoot, const BodyMotion& source,
                        const Alignment& alignment, const AlignedMotion& aligned)
-    : m_kTable(table), m_kTargetRoot(targetRoot), m_kSource(source), m_kAligned(aligned),
-      m_kAlignment(alignment)
+    : table_(table), targetRoot_(targetRoot), source_(source), aligned_(aligned), alignment_(alignment)
 {
     for (CNode* target : NodesOf(targetRoot))
     {
@@ -63,7 +62,7 @@ CBoneAimer::CBoneAimer(CRetargeter& table, CNode& targetRoot, const BodyMotion& 
 
 CBoneAimer::Row* CBoneAimer::RowOf(const char* target)
 {
-    const CNode* const node = FindNode(&m_kTargetRoot, target);
+    const CNode* const node = FindNode(&targetRoot_, target);
     for (Row& row : m_kRows)
     {
         if (row.target == node)
@@ -75,13 +74,13 @@ CBoneAimer::Row* CBoneAimer::RowOf(const char* target)
 bool CBoneAimer::LiesInTrunk(const CNode* source) const
 {
     const auto found = m_kIndex.find(source);
-    return found != m_kIndex.end() && m_kAlignment.joints[found->second].axis == kVec3UnitY;
+    return found != m_kIndex.end() && alignment_.joints[found->second].axis == kVec3UnitY;
 }
 
 // A collar tells nothing of the torso's turn that its own does not spoil.
 void CBoneAimer::TakeSpine()
 {
-    const std::vector<CNode*>& spine = m_kSource.body.spine;
+    const std::vector<CNode*>& spine = source_.body.spine;
     Row* const torso = RowOf(kTorsoBone);
     Row* const waist = RowOf(kWaistBone);
     if (!torso || !waist || !torso->source || LiesInTrunk(torso->source) || spine.empty())
@@ -112,24 +111,24 @@ void CBoneAimer::TakePelvis()
         if (!bone || bone->source)
             continue;
         bone->fixed = false;
-        bone->source = m_kSource.body.hip;
-        bone->turn = m_kAlignment.pelvisTurn;
+        bone->source = source_.body.hip;
+        bone->turn = alignment_.pelvisTurn;
     }
 }
 
 void CBoneAimer::SetRow(const Row& row)
 {
     if (row.fixed)
-        m_kTable.SetFixed(row.target, true);
+        table_.SetFixed(row.target, true);
     const auto found = m_kIndex.find(row.source);
     if (found == m_kIndex.end())
         return;
-    CNode* const source = m_kAligned.joints[found->second];
+    CNode* const source = aligned_.joints[found->second];
     const CBoneMesh* const mesh = FindBoneMesh(*source);
     const Mat3 frame = mesh ? NormalizedRows(mesh->m_kMatrix) : kMat3Identity;
-    m_kTable.SetSourceOf(row.target, source);
-    m_kTable.SetOffsetMatrix(row.target,
-                             NormalizedRows(RestWorld(*row.target)) * row.turn * Mat3Transpose(frame));
+    table_.SetSourceOf(row.target, source);
+    table_.SetOffsetMatrix(row.target,
+                           NormalizedRows(RestWorld(*row.target)) * row.turn * Mat3Transpose(frame));
 }
 
 void CBoneAimer::Aim()
@@ -137,8 +136,8 @@ void CBoneAimer::Aim()
     TakeSpine();
     TakeCollars();
     TakePelvis();
-    m_kTable.SetScenes(m_kAligned.root.Get(), &m_kTargetRoot);
-    m_kTable.SetPlainTurns(true); // a T-pose is made of whole quarter turns
+    table_.SetScenes(aligned_.root.Get(), &targetRoot_);
+    table_.SetPlainTurns(true); // a T-pose is made of whole quarter turns
     for (const Row& row : m_kRows)
         SetRow(row);
 }

@@ -35,7 +35,7 @@ class CMotionAligner
 {
 public:
     CMotionAligner(const BodyMotion& motion, const Alignment& alignment, EAlignedJoints joints)
-        : m_kMotion(motion), m_kAlignment(alignment), m_eJoints(joints),
+        : motion_(motion), alignment_(alignment), m_eJoints(joints),
           m_kScales(alignment.joints.size(), kVec3One)
     {
     }
@@ -44,20 +44,20 @@ public:
 private:
     const Mat3& ParentTurn(const JointAlignment& joint) const
     {
-        return joint.parent < 0 ? m_kAlignment.worldTurn : Turns(joint.parent);
+        return joint.parent < 0 ? alignment_.worldTurn : Turns(joint.parent);
     }
     bool Moves(const JointAlignment& joint) const
     {
         return joint.bearsBody || m_eJoints == EAlignedJoints::All;
     }
-    const Mat3& Turns(int joint) const { return m_kAlignment.joints[static_cast<size_t>(joint)].turn; }
+    const Mat3& Turns(int joint) const { return alignment_.joints[static_cast<size_t>(joint)].turn; }
     void AddJoint(const JointAlignment& joint);
     CKeyframeControl& AddTrack(CNode& node);
     void AddBone(const JointAlignment& joint, CNode& node);
     void AddKey(size_t index, int frame);
 
-    const BodyMotion& m_kMotion;
-    const Alignment& m_kAlignment;
+    const BodyMotion& motion_;
+    const Alignment& alignment_;
     EAlignedJoints m_eJoints;
     AlignedMotion m_kResult;
     std::vector<CKeyframeControl*> m_kTracks; // null where a joint does not move
@@ -81,7 +81,7 @@ void CMotionAligner::AddJoint(const JointAlignment& joint)
 
 CKeyframeControl& CMotionAligner::AddTrack(CNode& node)
 {
-    CKeyframeControl& track = AttachTrack(node, m_kMotion.frameCount, m_kMotion.frequency, node.m_kMatrix);
+    CKeyframeControl& track = AttachTrack(node, motion_.frameCount, motion_.frequency, node.m_kMatrix);
     track.m_kRotationKeys.reserve(track.m_kKeyTimes.size());
     return track;
 }
@@ -101,7 +101,7 @@ void CMotionAligner::AddBone(const JointAlignment& joint, CNode& node)
 
 void CMotionAligner::AddKey(size_t index, int frame)
 {
-    const JointAlignment& joint = m_kAlignment.joints[index];
+    const JointAlignment& joint = alignment_.joints[index];
     const Mat4& local = joint.node->m_kMatrix;
     CKeyframeControl& track = *m_kTracks[index];
     track.m_kRotationKeys.push_back(
@@ -124,12 +124,12 @@ void CMotionAligner::AddKey(size_t index, int frame)
 
 AlignedMotion CMotionAligner::Align()
 {
-    for (const JointAlignment& joint : m_kAlignment.joints)
+    for (const JointAlignment& joint : alignment_.joints)
         AddJoint(joint);
-    CMotionSampler sampler(*m_kMotion.root);
-    for (int frame = 0; frame < m_kMotion.frameCount; ++frame)
+    CMotionSampler sampler(*motion_.root);
+    for (int frame = 0; frame < motion_.frameCount; ++frame)
     {
-        const float time = TimeOfFrame(frame, m_kMotion.frequency);
+        const float time = TimeOfFrame(frame, motion_.frequency);
         if (!sampler.PosesNodes())
             sampler.PoseTree(time);
         for (size_t index = 0; index < m_kTracks.size(); ++index)
@@ -141,7 +141,7 @@ AlignedMotion CMotionAligner::Align()
             AddKey(index, frame);
         }
     }
-    m_kMotion.root->UpdateScene(0.0f, true);
+    motion_.root->UpdateScene(0.0f, true);
     m_kResult.root->UpdateScene(0.0f, true);
     return std::move(m_kResult);
 }

@@ -19,7 +19,7 @@ class CRoleFinder
 {
 public:
     CRoleFinder(const CTreePoser& tree, const CBodyMap& body)
-        : m_kTree(tree), m_kBody(body), m_kRoles(tree.Joints().size())
+        : tree_(tree), body_(body), m_kRoles(tree.Joints().size())
     {
     }
     std::vector<JointRole> Find();
@@ -27,7 +27,7 @@ public:
 private:
     JointRole* RoleOf(const CNode* joint)
     {
-        const int index = m_kTree.IndexOf(joint);
+        const int index = tree_.IndexOf(joint);
         return index < 0 ? nullptr : &m_kRoles[static_cast<size_t>(index)];
     }
     void AddChain(std::span<const Stop> chain, EBodySide side);
@@ -36,8 +36,8 @@ private:
     void FillShoulder(EBodySide side);
     CNode* TrunkAbove(const CNode* joint);
 
-    const CTreePoser& m_kTree;
-    const CBodyMap& m_kBody;
+    const CTreePoser& tree_;
+    const CBodyMap& body_;
     std::vector<JointRole> m_kRoles;
 };
 
@@ -69,16 +69,16 @@ void CRoleFinder::AddChain(std::span<const Stop> chain, EBodySide side)
 void CRoleFinder::AddTrunk()
 {
     std::vector<Stop> stops{
-        {m_kBody.hip, EBodyPart::Hip}
+        {body_.hip, EBodyPart::Hip}
     };
-    for (CNode* joint : m_kBody.spine)
+    for (CNode* joint : body_.spine)
         stops.push_back({joint, EBodyPart::Spine});
-    for (CNode* joint : m_kBody.neck)
+    for (CNode* joint : body_.neck)
         stops.push_back({joint, EBodyPart::Neck});
-    stops.push_back({m_kBody.head, EBodyPart::Head});
+    stops.push_back({body_.head, EBodyPart::Head});
     AddChain(stops, EBodySide::Left);
-    for (const CNode* joint = m_kBody.hip->GetParentNode(); RoleOf(joint); joint = joint->GetParentNode())
-        *RoleOf(joint) = {EBodyPart::AboveHip, EBodySide::Left, m_kBody.hip, false};
+    for (const CNode* joint = body_.hip->GetParentNode(); RoleOf(joint); joint = joint->GetParentNode())
+        *RoleOf(joint) = {EBodyPart::AboveHip, EBodySide::Left, body_.hip, false};
 }
 
 CNode* CRoleFinder::TrunkAbove(const CNode* joint)
@@ -91,8 +91,8 @@ CNode* CRoleFinder::TrunkAbove(const CNode* joint)
 
 void CRoleFinder::AddLimbs(EBodySide side)
 {
-    const BodyArm& arm = m_kBody.Arm(side);
-    const BodyLeg& leg = m_kBody.Leg(side);
+    const BodyArm& arm = body_.Arm(side);
+    const BodyLeg& leg = body_.Leg(side);
     const Stop armStops[] = {
         {arm.clavicle, EBodyPart::Clavicle},
         {arm.upperArm, EBodyPart::UpperArm},
@@ -113,7 +113,7 @@ void CRoleFinder::AddLimbs(EBodySide side)
 // What stands between the trunk and an upper arm is a clavicle where the body names none.
 void CRoleFinder::FillShoulder(EBodySide side)
 {
-    const BodyArm& arm = m_kBody.Arm(side);
+    const BodyArm& arm = body_.Arm(side);
     CNode* const trunk = TrunkAbove(arm.upperArm);
     if (!trunk)
         return;

@@ -34,14 +34,14 @@ class CTurnFinder
 public:
     CTurnFinder(const CTreePoser& tree, const std::vector<JointRole>& roles, const CBodyMap& body,
                 const CReferencePose& pose, const CMotionEvidence& evidence, bool isRest)
-        : m_kTree(tree), m_kRoles(roles), m_kBody(body), m_kPose(pose), m_kEvidence(evidence),
-          m_bIsRest(isRest), m_kSwings(roles.size()), m_kTurns(roles.size())
+        : tree_(tree), roles_(roles), body_(body), pose_(pose), evidence_(evidence), m_bIsRest(isRest),
+          m_kSwings(roles.size()), m_kTurns(roles.size())
     {
     }
     std::vector<Mat3> Find();
 
 private:
-    Mat3 WorldTurn(size_t joint) const { return NormalizedRows(m_kTree.Joints()[joint]->m_kWorldMatrix); }
+    Mat3 WorldTurn(size_t joint) const { return NormalizedRows(tree_.Joints()[joint]->m_kWorldMatrix); }
     Vec3 WayOn(const CNode& from, const CNode* next, double apart) const;
     Vec3 HipWay(size_t joint) const;
     Mat3 StartOf(size_t joint) const;
@@ -51,11 +51,11 @@ private:
     Mat3 HingeTwist(size_t joint, const Mat3& swing) const;
     void Set(size_t joint);
 
-    const CTreePoser& m_kTree;
-    const std::vector<JointRole>& m_kRoles;
-    const CBodyMap& m_kBody;
-    const CReferencePose& m_kPose;
-    const CMotionEvidence& m_kEvidence;
+    const CTreePoser& tree_;
+    const std::vector<JointRole>& roles_;
+    const CBodyMap& body_;
+    const CReferencePose& pose_;
+    const CMotionEvidence& evidence_;
     bool m_bIsRest;
     std::vector<Mat3> m_kSwings; // from the pose's world to the canonical one
     std::vector<Mat3> m_kTurns;
@@ -64,37 +64,37 @@ private:
 // The way to the next joint of the body that lies apart; zero where there is none.
 Vec3 CTurnFinder::WayOn(const CNode& from, const CNode* next, double apart) const
 {
-    if (const std::optional<Vec3> loose = m_kEvidence.MeanWay(from))
+    if (const std::optional<Vec3> loose = evidence_.MeanWay(from))
         return Turned(*loose, NormalizedRows(from.m_kWorldMatrix));
-    while (next && Vec3Length(WayTo(&from, next)) <= apart * m_kPose.legLength)
-        next = m_kRoles[static_cast<size_t>(m_kTree.IndexOf(next))].next;
+    while (next && Vec3Length(WayTo(&from, next)) <= apart * pose_.legLength)
+        next = roles_[static_cast<size_t>(tree_.IndexOf(next))].next;
     return WayTo(next ? &from : nullptr, next);
 }
 
 // Up the spine, as far as it takes to lean less.
 Vec3 CTurnFinder::HipWay(size_t joint) const
 {
-    const CNode& hip = *m_kTree.Joints()[joint];
-    for (const CNode* next = m_kRoles[joint].next; next;
-         next = m_kRoles[static_cast<size_t>(m_kTree.IndexOf(next))].next)
+    const CNode& hip = *tree_.Joints()[joint];
+    for (const CNode* next = roles_[joint].next; next;
+         next = roles_[static_cast<size_t>(tree_.IndexOf(next))].next)
     {
         const Vec3 way = WayOn(hip, next, kApartOfHip);
-        const double limit = next == m_kRoles[joint].next ? kHipLean : kChordLean;
-        if (way != kVec3Zero && AngleBetween(way, m_kPose.up) < limit)
+        const double limit = next == roles_[joint].next ? kHipLean : kChordLean;
+        if (way != kVec3Zero && AngleBetween(way, pose_.up) < limit)
             return way;
     }
-    return m_kPose.up;
+    return pose_.up;
 }
 
 Mat3 CTurnFinder::TrunkSwing(size_t joint) const
 {
-    const JointRole& role = m_kRoles[joint];
+    const JointRole& role = roles_[joint];
     if (role.part == EBodyPart::Hip)
-        return TurnUpright(HipWay(joint), HipLine(m_kBody));
-    const Vec3 way = WayOn(*m_kTree.Joints()[joint], role.next, kApart);
-    if (role.carriesArms && way != kVec3Zero && ShoulderLine(m_kBody) != kVec3Zero)
-        return TurnUpright(way, ShoulderLine(m_kBody));
-    const Mat3& start = role.part == EBodyPart::Neck ? m_kPose.trunk : m_kPose.hips;
+        return TurnUpright(HipWay(joint), HipLine(body_));
+    const Vec3 way = WayOn(*tree_.Joints()[joint], role.next, kApart);
+    if (role.carriesArms && way != kVec3Zero && ShoulderLine(body_) != kVec3Zero)
+        return TurnUpright(way, ShoulderLine(body_));
+    const Mat3& start = role.part == EBodyPart::Neck ? pose_.trunk : pose_.hips;
     return start * LeastSwing(Turned(way, start), kVec3UnitY);
 }
 
@@ -102,22 +102,22 @@ Mat3 CTurnFinder::TrunkSwing(size_t joint) const
 // arms do not take the clavicle's swing over, which goes up where theirs goes down.
 Mat3 CTurnFinder::StartOf(size_t joint) const
 {
-    const EBodyPart part = m_kRoles[joint].part;
-    const int parent = m_kTree.ParentOf(joint);
-    const EBodyPart above = parent < 0 ? EBodyPart::None : m_kRoles[static_cast<size_t>(parent)].part;
+    const EBodyPart part = roles_[joint].part;
+    const int parent = tree_.ParentOf(joint);
+    const EBodyPart above = parent < 0 ? EBodyPart::None : roles_[static_cast<size_t>(parent)].part;
     const bool isRoot =
         part == EBodyPart::Clavicle || part == EBodyPart::UpperArm || part == EBodyPart::Thigh;
     if (above != EBodyPart::None && (above == part || !isRoot))
         return m_kSwings[static_cast<size_t>(parent)];
-    return part == EBodyPart::Thigh ? m_kPose.hips : m_kPose.trunk;
+    return part == EBodyPart::Thigh ? pose_.hips : pose_.trunk;
 }
 
 // The turn about the bone that brings a hinge's axis where it belongs: left and right knees bend about +X,
 // a left elbow about -Y and a right one about +Y.
 Mat3 CTurnFinder::HingeTwist(size_t joint, const Mat3& swing) const
 {
-    const JointRole& role = m_kRoles[joint];
-    const std::optional<Vec3> axis = m_kEvidence.HingeAxis(*m_kTree.Joints()[joint]);
+    const JointRole& role = roles_[joint];
+    const std::optional<Vec3> axis = evidence_.HingeAxis(*tree_.Joints()[joint]);
     if (!axis)
         return kMat3Identity;
     const bool isLeg = role.part == EBodyPart::Thigh || role.part == EBodyPart::Shin;
@@ -130,25 +130,25 @@ Mat3 CTurnFinder::HingeTwist(size_t joint, const Mat3& swing) const
 
 Mat3 CTurnFinder::LimbSwing(size_t joint) const
 {
-    const JointRole& role = m_kRoles[joint];
+    const JointRole& role = roles_[joint];
     const Mat3 start = StartOf(joint);
-    const Vec3 way = WayOn(*m_kTree.Joints()[joint], role.next, kApart);
+    const Vec3 way = WayOn(*tree_.Joints()[joint], role.next, kApart);
     const Mat3 swing = start * LeastSwing(Turned(way, start), way == kVec3Zero ? kVec3Zero : AxisOf(role));
     return swing * HingeTwist(joint, swing);
 }
 
 Mat3 CTurnFinder::SwingOf(size_t joint) const
 {
-    switch (m_kRoles[joint].part)
+    switch (roles_[joint].part)
     {
     case EBodyPart::Hip:
     case EBodyPart::Spine:
     case EBodyPart::Neck:
         return TrunkSwing(joint);
     case EBodyPart::Head:
-        return m_kPose.trunk; // a head that is level and looks ahead, however its neck leans
+        return pose_.trunk; // a head that is level and looks ahead, however its neck leans
     case EBodyPart::Hand:
-        return HandTurn(*m_kTree.Joints()[joint], m_kRoles[joint].side, m_kPose, StartOf(joint));
+        return HandTurn(*tree_.Joints()[joint], roles_[joint].side, pose_, StartOf(joint));
     case EBodyPart::Clavicle:
     case EBodyPart::UpperArm:
     case EBodyPart::Forearm:
@@ -156,23 +156,23 @@ Mat3 CTurnFinder::SwingOf(size_t joint) const
     case EBodyPart::Shin:
         return LimbSwing(joint);
     default:
-        return m_kPose.hips;
+        return pose_.hips;
     }
 }
 
 void CTurnFinder::Set(size_t joint)
 {
-    const JointRole& role = m_kRoles[joint];
-    const int parent = m_kTree.ParentOf(joint);
+    const JointRole& role = roles_[joint];
+    const int parent = tree_.ParentOf(joint);
     const bool isForefoot = role.part == EBodyPart::Foot || role.part == EBodyPart::Toe;
     Mat3& turn = m_kTurns[joint];
-    if (m_kTree.Joints()[joint] == m_kBody.Leg(role.side).foot)
-        turn = FootTurn(m_kBody.Leg(role.side), m_kPose, m_kEvidence.SoleNormal(role.side), m_bIsRest);
+    if (tree_.Joints()[joint] == body_.Leg(role.side).foot)
+        turn = FootTurn(body_.Leg(role.side), pose_, evidence_.SoleNormal(role.side), m_bIsRest);
     else if (isForefoot && parent >= 0) // lies on the floor as the ankle's bone does
         turn = WorldTurn(joint) * Mat3Transpose(WorldTurn(static_cast<size_t>(parent))) *
                m_kTurns[static_cast<size_t>(parent)];
     else if (role.part == EBodyPart::None && parent >= 0)
-        turn = NormalizedRows(RestLocal(*m_kTree.Joints()[joint])) * m_kTurns[static_cast<size_t>(parent)];
+        turn = NormalizedRows(RestLocal(*tree_.Joints()[joint])) * m_kTurns[static_cast<size_t>(parent)];
     else
         turn = WorldTurn(joint) * SwingOf(joint);
     m_kSwings[joint] = Mat3Transpose(WorldTurn(joint)) * turn;
@@ -180,7 +180,7 @@ void CTurnFinder::Set(size_t joint)
 
 std::vector<Mat3> CTurnFinder::Find()
 {
-    for (size_t joint = 0; joint < m_kRoles.size(); ++joint)
+    for (size_t joint = 0; joint < roles_.size(); ++joint)
         Set(joint);
     return std::move(m_kTurns);
 }

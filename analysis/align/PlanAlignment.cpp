@@ -40,7 +40,8 @@ void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& d
 }
 
 // Whether bone rotations can be measured in a rest pose: the legs continue the trunk, and shoulders and feet
-// face the same way as the hips. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside the bones' real ends.
+// face the same way as the hips. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside
+// the bones' real ends.
 bool IsReference(const BodyStance& stance)
 {
     constexpr double kTrunkLimit = 40.0;
@@ -101,7 +102,7 @@ class CAlignmentPlanner
 {
 public:
     CAlignmentPlanner(const BodyMotion& motion, Alignment& alignment)
-        : m_kMotion(motion), m_kAlignment(alignment), m_kTree(NodesOf(*motion.root), motion.frequency),
+        : motion_(motion), alignment_(alignment), m_kTree(NodesOf(*motion.root), motion.frequency),
           m_kRoles(FindRoles(m_kTree, motion.body))
     {
     }
@@ -113,8 +114,8 @@ private:
     void PoseReference(const CMotionEvidence& evidence);
     void FillJoints(const std::vector<Mat3>& turns, const CReferencePose& pose);
 
-    const BodyMotion& m_kMotion;
-    Alignment& m_kAlignment;
+    const BodyMotion& motion_;
+    Alignment& alignment_;
     CTreePoser m_kTree;
     std::vector<JointRole> m_kRoles;
     std::vector<LooseWay> m_kWays;
@@ -126,20 +127,20 @@ private:
 void CAlignmentPlanner::LookAtRest()
 {
     m_kTree.PoseRest();
-    const double leg = LegLength(m_kMotion.body);
-    m_kAlignment.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
+    const double leg = LegLength(motion_.body);
+    alignment_.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
     m_kWays = FindLooseWays(m_kTree, m_kRoles, leg);
-    const BodyStance stance = RestStanceOf(m_kMotion.body);
+    const BodyStance stance = RestStanceOf(motion_.body);
     m_kUp = NearestAxis(stance.up);
-    m_bIsRest = IsReference(stance) || m_kMotion.frameCount <= 0;
+    m_bIsRest = IsReference(stance) || motion_.frameCount <= 0;
 }
 
 void CAlignmentPlanner::FindUp()
 {
-    const Vec3 worldUp = FindWorldUp(m_kMotion, m_bIsRest ? std::optional(m_kUp) : std::nullopt);
+    const Vec3 worldUp = FindWorldUp(motion_, m_bIsRest ? std::optional(m_kUp) : std::nullopt);
     m_kUp = m_bIsRest ? m_kUp : worldUp;
-    m_kAlignment.worldTurn = LeastSwing(worldUp, kVec3UnitY);
-    ReportUp(worldUp, m_kAlignment.report);
+    alignment_.worldTurn = LeastSwing(worldUp, kVec3UnitY);
+    ReportUp(worldUp, alignment_.report);
 }
 
 void CAlignmentPlanner::PoseReference(const CMotionEvidence& evidence)
@@ -147,37 +148,37 @@ void CAlignmentPlanner::PoseReference(const CMotionEvidence& evidence)
     if (m_bIsRest)
         m_kTree.PoseRest();
     else
-        m_kTree.Pose(m_kAlignment.report.referenceFrame = evidence.ReferenceFrame());
+        m_kTree.Pose(alignment_.report.referenceFrame = evidence.ReferenceFrame());
 }
 
 void CAlignmentPlanner::FillJoints(const std::vector<Mat3>& turns, const CReferencePose& pose)
 {
-    const auto hip = static_cast<size_t>(m_kTree.IndexOf(m_kMotion.body.hip));
-    const Mat3 pelvis = NormalizedRows(m_kMotion.body.hip->m_kWorldMatrix) * pose.hips;
-    m_kAlignment.pelvisTurn = Mat3Transpose(pelvis) * turns[hip];
+    const auto hip = static_cast<size_t>(m_kTree.IndexOf(motion_.body.hip));
+    const Mat3 pelvis = NormalizedRows(motion_.body.hip->m_kWorldMatrix) * pose.hips;
+    alignment_.pelvisTurn = Mat3Transpose(pelvis) * turns[hip];
     for (size_t i = 0; i < turns.size(); ++i)
     {
         CNode* const joint = m_kTree.Joints()[i];
-        m_kAlignment.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], RestLocal(*joint).Translation(),
-                                       AxisOf(m_kRoles[i]), m_kDoubled[i],
-                                       m_kRoles[i].part != EBodyPart::None});
+        alignment_.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], RestLocal(*joint).Translation(),
+                                     AxisOf(m_kRoles[i]), m_kDoubled[i],
+                                     m_kRoles[i].part != EBodyPart::None});
     }
-    MarkBearers(m_kAlignment.joints);
+    MarkBearers(alignment_.joints);
 }
 
 bool CAlignmentPlanner::Plan()
 {
     LookAtRest();
     FindUp();
-    m_kDoubled = FindDoubled(m_kTree, m_kMotion);
-    ReportDoubled(m_kTree.Joints(), m_kDoubled, m_kAlignment.report);
-    const CMotionEvidence evidence(m_kMotion, m_kAlignment.worldTurn, m_kWays);
+    m_kDoubled = FindDoubled(m_kTree, motion_);
+    ReportDoubled(m_kTree.Joints(), m_kDoubled, alignment_.report);
+    const CMotionEvidence evidence(motion_, alignment_.worldTurn, m_kWays);
     PoseReference(evidence);
-    const CReferencePose pose(m_kMotion.body, m_kUp);
+    const CReferencePose pose(motion_.body, m_kUp);
     const std::vector<Mat3> turns =
-        FindJointTurns(m_kTree, m_kRoles, m_kMotion.body, pose, evidence, m_bIsRest);
+        FindJointTurns(m_kTree, m_kRoles, motion_.body, pose, evidence, m_bIsRest);
     FillJoints(turns, pose);
-    m_kMotion.root->UpdateScene(0.0f, true);
+    motion_.root->UpdateScene(0.0f, true);
     return IsFinite(turns);
 }
 

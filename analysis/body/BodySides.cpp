@@ -25,9 +25,9 @@ constexpr float kKneeWeight = 0.7f;
 class CPose
 {
 public:
-    CPose(const CJointTree& tree, size_t stance) : m_kTree(tree), m_uiStance(stance) {}
+    CPose(const CJointTree& tree, size_t stance) : tree_(tree), m_uiStance(stance) {}
 
-    const Vec3& Place(int joint) const { return m_kTree.Stances().Place(m_uiStance, joint); }
+    const Vec3& Place(int joint) const { return tree_.Stances().Place(m_uiStance, joint); }
     Vec3 Direction(int from, int to) const { return Vec3Normalized(Place(to) - Place(from)); }
     Vec3 Up(const LegsOfBody& body) const { return Direction(body.hip, body.chest); }
     Vec3 Sideways(const LegsOfBody& body) const { return Direction(body.legs[1].thigh, body.legs[0].thigh); }
@@ -37,14 +37,14 @@ public:
     {
         if (leg.ankle < 0)
             return kVec3Zero;
-        const Vec3& end = m_kTree.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
+        const Vec3& end = tree_.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
         const Vec3 part = Across(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
         return Vec3Length(part) > kFootLeast ? Vec3Normalized(part) : kVec3Zero;
     }
     // Where a knee goes when it bends, longer for a greater bend up to 1.
     Vec3 KneeForward(const Leg& leg) const
     {
-        const Vec3 ankle = leg.ankle >= 0 ? Place(leg.ankle) : m_kTree.Stances().Tip(m_uiStance, leg.knee);
+        const Vec3 ankle = leg.ankle >= 0 ? Place(leg.ankle) : tree_.Stances().Tip(m_uiStance, leg.knee);
         const Vec3 line = Vec3Normalized(ankle - Place(leg.thigh));
         const Vec3 part = Across(Direction(leg.thigh, leg.knee), line);
         const double sine = Vec3Length(part);
@@ -62,7 +62,7 @@ public:
     }
 
 private:
-    const CJointTree& m_kTree;
+    const CJointTree& tree_;
     size_t m_uiStance;
 };
 

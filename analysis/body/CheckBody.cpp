@@ -62,7 +62,7 @@ class CBodyChecker
 {
 public:
     CBodyChecker(const CBodyMap& body, const CJointTree& tree)
-        : m_kBody(body), m_kTree(tree), m_kLegs(LegsOf(tree, body))
+        : body_(body), tree_(tree), m_kLegs(LegsOf(tree, body))
     {
     }
 
@@ -70,7 +70,7 @@ public:
 
 private:
     void Doubt(EBodyDoubt kind, BodyPlace place) { m_kDoubts.push_back({kind, place}); }
-    int Joint(BodyPlace place) const { return m_kTree.IndexOf(JointAt(m_kBody, place)); }
+    int Joint(BodyPlace place) const { return tree_.IndexOf(JointAt(body_, place)); }
     void CheckCarriers();
     void CheckSides();
     void CheckLegsDown();
@@ -78,8 +78,8 @@ private:
     void CheckEvenness(BodyPlace place);
     MappedLimb LimbOf(ELimb limb, EBodySide side) const;
 
-    const CBodyMap& m_kBody;
-    const CJointTree& m_kTree;
+    const CBodyMap& body_;
+    const CJointTree& tree_;
     LegsOfBody m_kLegs;
     std::vector<BodyDoubt> m_kDoubts;
 };
@@ -105,8 +105,8 @@ void CBodyChecker::CheckCarriers()
 {
     for (const BodyPlace& place : BodyPlaces())
     {
-        const CNode* const node = JointAt(m_kBody, place);
-        const CNode* const carrier = CarrierOf(m_kBody, place);
+        const CNode* const node = JointAt(body_, place);
+        const CNode* const carrier = CarrierOf(body_, place);
         if (node && carrier && (node == carrier || !IsAtOrBelow(node, carrier)))
             Doubt(EBodyDoubt::NotBelow, place);
     }
@@ -114,7 +114,7 @@ void CBodyChecker::CheckCarriers()
 
 void CBodyChecker::CheckLegsDown()
 {
-    const CStances& stances = m_kTree.Stances();
+    const CStances& stances = tree_.Stances();
     const auto goesUp = [&](const LegsOfBody::Leg& leg, size_t stance) {
         const Vec3 down = stances.Place(stance, leg.knee) - stances.Place(stance, leg.thigh);
         return Vec3Dot(down, stances.Place(stance, m_kLegs.chest) - stances.Place(stance, m_kLegs.hip)) > 0.0;
@@ -132,10 +132,10 @@ void CBodyChecker::CheckLegsDown()
 
 void CBodyChecker::CheckSides()
 {
-    if (JudgeSides(m_kTree, m_kLegs) < -kSidesSure)
+    if (JudgeSides(tree_, m_kLegs) < -kSidesSure)
         Doubt(EBodyDoubt::SidesSwapped, {Thigh, EBodySide::Left});
     const double arms =
-        JudgeAlong(m_kTree, m_kLegs, Joint({UpperArm, EBodySide::Left}), Joint({UpperArm, EBodySide::Right}));
+        JudgeAlong(tree_, m_kLegs, Joint({UpperArm, EBodySide::Left}), Joint({UpperArm, EBodySide::Right}));
     if (arms < -kSidesSure)
         Doubt(EBodyDoubt::SidesSwapped, {UpperArm, EBodySide::Left});
 }
@@ -155,8 +155,8 @@ MappedLimb CBodyChecker::LimbOf(ELimb limb, EBodySide side) const
     const int mirror = Joint({first, other});
     if (upper < 0 || lower < 0 || end < 0 || mirror < 0)
         return {};
-    MappedLimb mapped{m_kTree.WayDown(m_kTree.CommonAncestor(upper, mirror), end), {}, true};
-    for (const int joint : m_kTree.MainChain(m_kTree.MainChild(end), kMostBehind))
+    MappedLimb mapped{tree_.WayDown(tree_.CommonAncestor(upper, mirror), end), {}, true};
+    for (const int joint : tree_.MainChain(tree_.MainChild(end), kMostBehind))
         mapped.chain.push_back(joint);
     const auto stopOf = [&](int joint) {
         return static_cast<size_t>(std::ranges::find(mapped.chain, joint) - mapped.chain.begin());
@@ -173,8 +173,8 @@ void CBodyChecker::CheckLimb(ELimb limb, EBodySide side)
     if (!mapped.found)
         return;
     const LimbChains chains(&mapped.chain, 1);
-    const LimbFit fit = JudgeLimb(m_kTree, chains, limb, mapped.joints);
-    const LimbFit best = FitLimb(m_kTree, chains, limb);
+    const LimbFit fit = JudgeLimb(tree_, chains, limb, mapped.joints);
+    const LimbFit best = FitLimb(tree_, chains, limb);
     if (!fit.found)
         return Doubt(EBodyDoubt::OddLength, place);
     if (!best.found || fit.cost < best.cost + kBetterChoice)
@@ -193,8 +193,8 @@ void CBodyChecker::CheckEvenness(BodyPlace place)
         const int top = Joint({place.joint, side});
         const int bottom = Joint(next);
         double length = 0.0;
-        for (const int joint : top < 0 || bottom < 0 ? std::vector<int>() : m_kTree.WayDown(top, bottom))
-            length += m_kTree.Length(joint);
+        for (const int joint : top < 0 || bottom < 0 ? std::vector<int>() : tree_.WayDown(top, bottom))
+            length += tree_.Length(joint);
         return length;
     };
     const double left = boneOf(EBodySide::Left);

@@ -49,7 +49,7 @@ double Capped(double cost)
 class CLine
 {
 public:
-    CLine(const CJointTree& tree, const std::vector<int>& chain) : m_kTree(tree), m_kChain(chain)
+    CLine(const CJointTree& tree, const std::vector<int>& chain) : tree_(tree), chain_(chain)
     {
         double way = 0.0;
         for (size_t i = 0; i < chain.size(); ++i)
@@ -57,7 +57,7 @@ public:
         m_kWay.push_back(way + tree.TipLength(chain.back()));
     }
 
-    size_t LastStop() const { return m_kChain.size(); }
+    size_t LastStop() const { return chain_.size(); }
     // What it costs a bone that its inner joints are passed over.
     double PassedCost(size_t from, size_t to) const
     {
@@ -74,7 +74,7 @@ public:
         if (to - from < 2)
             return 0.0;
         double most = 0.0;
-        const CStances& stances = m_kTree.Stances();
+        const CStances& stances = tree_.Stances();
         for (size_t stance = 0; stance < stances.Count(); ++stance)
             most = std::max(most, BendAt(stance, from, to));
         return most;
@@ -82,19 +82,18 @@ public:
 
     const Vec3& Place(size_t stance, size_t stop) const
     {
-        const CStances& stances = m_kTree.Stances();
-        return stop == LastStop() ? stances.Tip(stance, m_kChain.back())
-                                  : stances.Place(stance, m_kChain[stop]);
+        const CStances& stances = tree_.Stances();
+        return stop == LastStop() ? stances.Tip(stance, chain_.back()) : stances.Place(stance, chain_[stop]);
     }
-    size_t StanceCount() const { return m_kTree.Stances().Count(); }
+    size_t StanceCount() const { return tree_.Stances().Count(); }
 
 private:
     bool Branches(size_t stop) const
     {
-        const std::vector<int>& children = m_kTree.Children(m_kChain[stop]);
+        const std::vector<int>& children = tree_.Children(chain_[stop]);
         const double least =
-            children.empty() ? 0.0 : kAsLongBranch * m_kTree.Reach(m_kTree.MainChild(m_kChain[stop]));
-        return std::ranges::count_if(children, [&](int child) { return m_kTree.Reach(child) >= least; }) > 1;
+            children.empty() ? 0.0 : kAsLongBranch * tree_.Reach(tree_.MainChild(chain_[stop]));
+        return std::ranges::count_if(children, [&](int child) { return tree_.Reach(child) >= least; }) > 1;
     }
     double BendAt(size_t stance, size_t from, size_t to) const
     {
@@ -105,8 +104,8 @@ private:
         return straight > 0.0 ? way / straight - 1.0 : kMostOfOnePart;
     }
 
-    const CJointTree& m_kTree;
-    const std::vector<int>& m_kChain;
+    const CJointTree& tree_;
+    const std::vector<int>& chain_;
     std::vector<double> m_kWay; // from the first joint to each stop
 };
 

@@ -17,25 +17,25 @@ EFailure CBVHExam::Examine(const std::string& path)
     const EFailure failure = m_kFile.Open(path);
     if (failure != EFailure::None)
         return failure;
-    m_kText = CleanText(m_kFile.Text(), m_kClean, m_kFindings);
+    m_kText = CleanText(m_kFile.Text(), m_kClean, findings_);
     CLineCursor lines(m_kText);
-    const bool hasMotion = CHierarchyCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline);
-    CheckJoints(m_kOutline, m_kFindings);
+    const bool hasMotion = CHierarchyCheck(lines, findings_, m_kEdits).Read(m_kOutline);
+    CheckJoints(m_kOutline, findings_);
     if (!hasMotion || m_kOutline.joints.empty())
         return EFailure::None;
-    if (CMotionHeadCheck(lines, m_kFindings, m_kEdits).Read(m_kOutline))
+    if (CMotionHeadCheck(lines, findings_, m_kEdits).Read(m_kOutline))
         ReadRows(lines);
     return EFailure::None;
 }
 
 void CBVHExam::ReadRows(CLineCursor& lines)
 {
-    CRowCheck check(m_kOutline, m_kFindings);
+    CRowCheck check(m_kOutline, findings_);
     check.Read(lines);
     m_bRows = true;
     m_kPlan = check.Plan();
-    m_kPlan.subtrahends = CheckOffsets(m_kOutline, check.Table(), m_kFindings);
-    CheckSpikes(m_kOutline, check.Table(), m_kFindings);
+    m_kPlan.subtrahends = CheckOffsets(m_kOutline, check.Table(), findings_);
+    CheckSpikes(m_kOutline, check.Table(), findings_);
     m_kCells = check.Table().TakeMended();
     if (m_kPlan.correctsCount)
         m_kEdits.Replace(m_kOutline.framesBegin, m_kOutline.framesLength, std::to_string(m_kPlan.rowCount));

@@ -21,7 +21,7 @@ class CLineCursor;
 class CBVHExam
 {
 public:
-    explicit CBVHExam(CFindings& findings) : m_kFindings(findings) {}
+    explicit CBVHExam(CFindings& findings) : findings_(findings) {}
 
     /// Reads the whole text. None on success, else why there is none to examine.
     EFailure Examine(const std::string& path);
@@ -41,7 +41,7 @@ private:
     CMappedFile m_kFile;
     std::string m_kClean; // the text, where bytes of the file had to go
     std::string_view m_kText;
-    CFindings& m_kFindings;
+    CFindings& findings_;
     CTextEdits m_kEdits;
     BVHOutline m_kOutline;
     RowPlan m_kPlan;

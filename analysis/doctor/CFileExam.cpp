@@ -28,7 +28,7 @@ void CFileExam::ExamineBVH(const std::string& path)
     m_spText->Forget();
     CMotionFile motion;
     if (motion.Load(path))
-        m_kFacts = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
+        facts_ = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
     // What the text is said to have wrong is what the reader tripped over.
     else if (!m_kFindings.HasErrors())
         m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
@@ -55,7 +55,7 @@ void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record
 
 void CFileExam::ExaminePoses(const CMotionFile& motion)
 {
-    m_kFacts = CheckPoses(motion, nullptr, m_kFindings);
+    facts_ = CheckPoses(motion, nullptr, m_kFindings);
 }
 
 } // namespace gw

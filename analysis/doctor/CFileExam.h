@@ -26,7 +26,7 @@ public:
 
     const CFindings& Findings() const { return m_kFindings; }
     /// Nothing where no motion was read.
-    const std::optional<MotionFacts>& Facts() const { return m_kFacts; }
+    const std::optional<MotionFacts>& Facts() const { return facts_; }
 
     /// Writes a BVH file again with all mendable faults gone, once: its text is given back after that. False
     /// when it cannot be written.
@@ -34,7 +34,7 @@ public:
 
 private:
     CFindings m_kFindings;
-    std::optional<MotionFacts> m_kFacts;
+    std::optional<MotionFacts> facts_;
     std::unique_ptr<CBVHExam> m_spText; // for a mended copy
 };
 

@@ -49,7 +49,7 @@ const CHierarchyCheck::KeywordRow CHierarchyCheck::kKeywords[] = {
 bool CHierarchyCheck::Read(BVHOutline& outline)
 {
     // The reader refuses more joints than it has room for; until then they stay in proportion to the file.
-    while (!m_bMotion && m_kJoints.size() <= kBoneLimit && m_kLines.Next())
+    while (!m_bMotion && m_kJoints.size() <= kBoneLimit && lines_.Next())
         ReadLine();
     PartLines();
     PlanColumns(outline);
@@ -60,12 +60,12 @@ bool CHierarchyCheck::Read(BVHOutline& outline)
 // A brace counts alone on its line; words that share one are put on lines of their own.
 void CHierarchyCheck::ReadLine()
 {
-    std::string_view rest = m_kLines.Line();
+    std::string_view rest = lines_.Line();
     bool first = true;
     for (std::string_view part = NextPart(rest); !part.empty(); part = NextPart(rest), first = false)
     {
         if (!first && m_bHierarchy && m_kShared.size() < CTextEdits::kMost)
-            m_kShared.push_back({m_kLines.Number(), m_kLines.OffsetOf(part)});
+            m_kShared.push_back({lines_.Number(), lines_.OffsetOf(part)});
         ReadWords(part);
     }
 }
@@ -78,13 +78,13 @@ void CHierarchyCheck::PartLines()
     for (const auto& [line, offset] : m_kShared)
     {
         if (closed)
-            m_kEdits.Replace(offset, 0, "\n");
+            edits_.Replace(offset, 0, "\n");
         if (std::exchange(told, line) == line)
             continue;
         if (closed)
-            m_kFindings.Add(EFault::BraceOnLine, line);
+            findings_.Add(EFault::BraceOnLine, line);
         else
-            m_kFindings.AddUnmended(EFault::BraceOnLine, line);
+            findings_.AddUnmended(EFault::BraceOnLine, line);
     }
 }
 
@@ -105,15 +105,15 @@ void CHierarchyCheck::CheckSpelling(std::string_view word, std::string_view want
 {
     if (word == wanted)
         return;
-    m_kFindings.Add(EFault::KeywordSpelling, m_kLines.Number(), std::string(word));
-    m_kEdits.Replace(m_kLines.OffsetOf(word), word.size(), wanted);
+    findings_.Add(EFault::KeywordSpelling, lines_.Number(), std::string(word));
+    edits_.Replace(lines_.OffsetOf(word), word.size(), wanted);
 }
 
 void CHierarchyCheck::OpenRoot(std::string_view name)
 {
     if (++m_uiRoots > 1)
     {
-        m_kFindings.Add(EFault::SecondRoot, m_kLines.Number(), Quote(NextToken(name)));
+        findings_.Add(EFault::SecondRoot, lines_.Number(), Quote(NextToken(name)));
         return m_kOpen.push_back({OutlineJoint::kNoParent});
     }
     Add(name, OutlineJoint::kNoParent);
@@ -133,7 +133,7 @@ void CHierarchyCheck::Add(std::string_view name, size_t parent)
     m_kOpen.push_back({m_kJoints.size()});
     OutlineJoint joint;
     joint.parent = parent;
-    joint.line = m_kLines.Number();
+    joint.line = lines_.Number();
     joint.name = ReadName(name);
     m_kJoints.push_back(std::move(joint));
 }
@@ -153,8 +153,8 @@ std::string CHierarchyCheck::ReadName(std::string_view name)
     const std::string_view whole(first.data(), static_cast<size_t>(end - first.data()));
     if (whole.size() == first.size())
         return joined;
-    m_kFindings.Add(EFault::BlankInName, m_kLines.Number(), Quote(whole));
-    m_kEdits.Replace(m_kLines.OffsetOf(whole), whole.size(), joined);
+    findings_.Add(EFault::BlankInName, lines_.Number(), Quote(whole));
+    edits_.Replace(lines_.OffsetOf(whole), whole.size(), joined);
     return joined;
 }
 
@@ -184,8 +184,8 @@ void CHierarchyCheck::ReadOffset(std::string_view numbers)
     if (HasDecimalCommas(numbers, 3))
     {
         points = WithPoints(numbers);
-        m_kFindings.Add(EFault::DecimalComma, m_kLines.Number());
-        m_kEdits.Replace(m_kLines.OffsetOf(numbers), numbers.size(), points);
+        findings_.Add(EFault::DecimalComma, lines_.Number());
+        edits_.Replace(lines_.OffsetOf(numbers), numbers.size(), points);
         numbers = points;
     }
     Vec3 offset = kVec3Zero;
@@ -194,12 +194,12 @@ void CHierarchyCheck::ReadOffset(std::string_view numbers)
         const std::string_view token = NextToken(numbers);
         ScanFloat(token, *component);
         if (const auto fault = FaultOfNumber(token); fault && !token.empty())
-            m_kFindings.AddUnmended(*fault, m_kLines.Number(), Quote(token));
+            findings_.AddUnmended(*fault, lines_.Number(), Quote(token));
     }
     if (OutlineJoint* const joint = Joint())
     {
         joint->offset = offset;
-        joint->offsetLine = m_kLines.Number();
+        joint->offsetLine = lines_.Number();
     }
 }
 
@@ -218,7 +218,7 @@ void CHierarchyCheck::ReadChannels(std::string_view rest)
         channels.push_back(channel);
     }
     if (channels.size() > count)
-        m_kFindings.Add(EFault::ChannelCount, m_kLines.Number());
+        findings_.Add(EFault::ChannelCount, lines_.Number());
     if (OutlineJoint* const joint = Joint())
         joint->channels = std::move(channels);
 }
@@ -226,7 +226,7 @@ void CHierarchyCheck::ReadChannels(std::string_view rest)
 void CHierarchyCheck::CheckChannel(std::string_view word, int channel)
 {
     if (channel == OutlineJoint::kNoChannel)
-        m_kFindings.Add(EFault::UnknownChannel, m_kLines.Number(), Quote(word));
+        findings_.Add(EFault::UnknownChannel, lines_.Number(), Quote(word));
     else
         CheckSpelling(word, kChannelNames[channel]);
 }

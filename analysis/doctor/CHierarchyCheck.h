@@ -19,7 +19,7 @@ class CHierarchyCheck
 {
 public:
     CHierarchyCheck(CLineCursor& lines, CFindings& findings, CTextEdits& edits)
-        : m_kLines(lines), m_kFindings(findings), m_kEdits(edits)
+        : lines_(lines), findings_(findings), edits_(edits)
     {
     }
 
@@ -60,9 +60,9 @@ private:
     void PlanColumns(BVHOutline& outline);
     OutlineJoint* Joint();
 
-    CLineCursor& m_kLines;
-    CFindings& m_kFindings;
-    CTextEdits& m_kEdits;
+    CLineCursor& lines_;
+    CFindings& findings_;
+    CTextEdits& edits_;
     std::vector<OutlineJoint> m_kJoints;
     std::vector<Block> m_kOpen;
     std::vector<SharedLine> m_kShared;

@@ -52,20 +52,20 @@ bool CMotionHeadCheck::Read(BVHOutline& outline)
 {
     if (!ReadFrameCount(outline) || !ReadFrameTime(outline))
         return false;
-    outline.rowsBegin = m_kLines.NextOffset();
-    outline.rowsLine = m_kLines.NextNumber();
+    outline.rowsBegin = lines_.NextOffset();
+    outline.rowsLine = lines_.NextNumber();
     return true;
 }
 
 bool CMotionHeadCheck::SkipEmptyLines()
 {
-    while (m_kLines.Next())
+    while (lines_.Next())
     {
-        if (!m_kLines.IsBlank())
+        if (!lines_.IsBlank())
             return true;
-        m_kFindings.Add(EFault::EmptyLineBeforeFrames, m_kLines.Number());
-        const size_t begin = m_kLines.OffsetOf(m_kLines.Line());
-        m_kEdits.Replace(begin, m_kLines.NextOffset() - begin, "");
+        findings_.Add(EFault::EmptyLineBeforeFrames, lines_.Number());
+        const size_t begin = lines_.OffsetOf(lines_.Line());
+        edits_.Replace(begin, lines_.NextOffset() - begin, "");
     }
     return false;
 }
@@ -75,7 +75,7 @@ bool CMotionHeadCheck::NextValue(std::string_view keyword, std::string_view& val
 {
     if (!SkipEmptyLines())
         return false;
-    const std::string_view line = m_kLines.Line();
+    const std::string_view line = lines_.Line();
     value = line;
     if (!TakeKeyword(keyword, value))
         return false;
@@ -83,8 +83,8 @@ bool CMotionHeadCheck::NextValue(std::string_view keyword, std::string_view& val
     value.remove_prefix(begin);
     if (!value.empty() && !IsSpelled(keyword, line))
     {
-        m_kFindings.Add(EFault::KeywordSpelling, m_kLines.Number(), Quote(line));
-        m_kEdits.Replace(m_kLines.OffsetOf(line), line.size() - value.size(), std::string(keyword) + ' ');
+        findings_.Add(EFault::KeywordSpelling, lines_.Number(), Quote(line));
+        edits_.Replace(lines_.OffsetOf(line), line.size() - value.size(), std::string(keyword) + ' ');
     }
     return !value.empty();
 }
@@ -95,8 +95,8 @@ bool CMotionHeadCheck::ReadFrameCount(BVHOutline& outline)
     if (!NextValue("Frames:", value))
         return false;
     const std::string_view token = NextToken(value);
-    outline.framesLine = m_kLines.Number();
-    outline.framesBegin = m_kLines.OffsetOf(token);
+    outline.framesLine = lines_.Number();
+    outline.framesBegin = lines_.OffsetOf(token);
     outline.framesLength = token.size();
     return ScanInt(token, outline.frameCount);
 }
@@ -111,13 +111,13 @@ bool CMotionHeadCheck::ReadFrameTime(BVHOutline& outline)
     if (HasDecimalCommas(value, 1))
     {
         points = WithPoints(value);
-        m_kFindings.Add(EFault::DecimalComma, m_kLines.Number());
-        m_kEdits.Replace(m_kLines.OffsetOf(value), value.size(), points);
+        findings_.Add(EFault::DecimalComma, lines_.Number());
+        edits_.Replace(lines_.OffsetOf(value), value.size(), points);
         value = points;
     }
-    outline.frameTimeLine = m_kLines.Number();
+    outline.frameTimeLine = lines_.Number();
     if (ParseDouble(NextToken(value)) >= kLongestFrame)
-        m_kFindings.Add(EFault::RateForTime, m_kLines.Number());
+        findings_.Add(EFault::RateForTime, lines_.Number());
     return true;
 }
 

@@ -15,7 +15,7 @@ class CMotionHeadCheck
 {
 public:
     CMotionHeadCheck(CLineCursor& lines, CFindings& findings, CTextEdits& edits)
-        : m_kLines(lines), m_kFindings(findings), m_kEdits(edits)
+        : lines_(lines), findings_(findings), edits_(edits)
     {
     }
 
@@ -29,9 +29,9 @@ private:
     bool ReadFrameCount(BVHOutline& outline);
     bool ReadFrameTime(BVHOutline& outline);
 
-    CLineCursor& m_kLines;
-    CFindings& m_kFindings;
-    CTextEdits& m_kEdits;
+    CLineCursor& lines_;
+    CFindings& findings_;
+    CTextEdits& edits_;
 };
 
 } // namespace gw

@@ -27,7 +27,7 @@ bool IsSeparator(char c)
 
 void CRowCheck::Read(CLineCursor& lines)
 {
-    m_kTable = CRowTable(m_kOutline.columnCount);
+    m_kTable = CRowTable(outline_.columnCount);
     while (lines.Next())
     {
         if (lines.IsBlank())
@@ -49,9 +49,9 @@ void CRowCheck::Read(CLineCursor& lines)
 // Behind the last frame that is promised, what is no whole row is no row at all.
 bool CRowCheck::IsPastRows(std::string_view line) const
 {
-    if (m_kOutline.frameCount > 0 && m_uiRows < static_cast<size_t>(m_kOutline.frameCount))
+    if (outline_.frameCount > 0 && m_uiRows < static_cast<size_t>(outline_.frameCount))
         return false;
-    if (!HasDecimalCommas(line, m_kOutline.columnCount) && CountTokens(line) != m_kOutline.columnCount)
+    if (!HasDecimalCommas(line, outline_.columnCount) && CountTokens(line) != outline_.columnCount)
         return true;
     return FaultOfNumber(NextToken(line)).has_value();
 }
@@ -60,7 +60,7 @@ void CRowCheck::TellEmptyLines()
 {
     const EFault fault = m_uiRows == 0 ? EFault::EmptyLineBeforeFrames : EFault::EmptyLineInRows;
     for (size_t i = 0; i < m_uiEmptyLines; ++i)
-        m_kFindings.Add(fault, m_uiFirstEmptyLine + i);
+        findings_.Add(fault, m_uiFirstEmptyLine + i);
     m_uiEmptyLines = 0;
 }
 
@@ -70,9 +70,9 @@ void CRowCheck::TellShortRow(bool isLast)
     if (m_uiShortLine == 0)
         return;
     if (isLast && m_uiRows > 1)
-        m_kFindings.Add(EFault::ShortRow, m_uiShortLine);
+        findings_.Add(EFault::ShortRow, m_uiShortLine);
     else
-        m_kFindings.AddUnmended(EFault::ShortRow, m_uiShortLine);
+        findings_.AddUnmended(EFault::ShortRow, m_uiShortLine);
     m_kPlan.dropsLast = isLast && m_uiRows > 1;
     m_uiShortLine = 0;
 }
@@ -80,17 +80,17 @@ void CRowCheck::TellShortRow(bool isLast)
 void CRowCheck::ReadRow(std::string_view row, size_t line)
 {
     std::string points;
-    if (HasDecimalCommas(row, m_kOutline.columnCount))
+    if (HasDecimalCommas(row, outline_.columnCount))
     {
-        m_kFindings.Add(EFault::DecimalComma, line);
+        findings_.Add(EFault::DecimalComma, line);
         points = WithPoints(row);
         row = points;
     }
     const size_t count = ReadValues(row);
-    const bool whole = count >= m_kOutline.columnCount;
+    const bool whole = count >= outline_.columnCount;
     TellBadTokens(whole, line);
-    if (count > m_kOutline.columnCount)
-        m_kFindings.Add(EFault::LongRow, line);
+    if (count > outline_.columnCount)
+        findings_.Add(EFault::LongRow, line);
     if (whole)
         m_kTable.Append(m_kRow, line);
     else
@@ -109,7 +109,7 @@ size_t CRowCheck::ReadValues(std::string_view row)
         text = std::find_if_not(text, end, IsSeparator);
         if (text == end)
             return m_kRow.size();
-        if (m_kRow.size() == m_kOutline.columnCount)
+        if (m_kRow.size() == outline_.columnCount)
             return m_kRow.size() + CountTokens({text, end});
         ENumber kind;
         const char* next;
@@ -140,23 +140,22 @@ void CRowCheck::TellBadTokens(bool whole, size_t line)
         if (whole && token.fault == EFault::NaN)
             m_kBadCells.push_back({row, static_cast<uint32_t>(token.column)});
         else
-            m_kFindings.AddUnmended(token.fault, line, Quote(token.text));
+            findings_.AddUnmended(token.fault, line, Quote(token.text));
     }
 }
 
 void CRowCheck::CompareCounts()
 {
     TellShortRow(true);
-    const auto promised = static_cast<size_t>(std::max(m_kOutline.frameCount, 0));
+    const auto promised = static_cast<size_t>(std::max(outline_.frameCount, 0));
     m_kPlan.rowCount = m_uiRows - m_kPlan.dropsLast;
     m_kPlan.correctsCount = m_uiRows > 0 && m_kPlan.rowCount != promised;
     if (m_uiRows == 0 && promised == 0)
-        m_kFindings.Add(EFault::NoFrames, m_kOutline.framesLine);
+        findings_.Add(EFault::NoFrames, outline_.framesLine);
     else if (m_uiRows == 0)
-        m_kFindings.AddUnmended(EFault::MissingRows, m_kOutline.framesLine);
+        findings_.AddUnmended(EFault::MissingRows, outline_.framesLine);
     else if (m_uiRows != promised)
-        m_kFindings.Add(m_uiRows < promised ? EFault::MissingRows : EFault::SurplusRows,
-                        m_kOutline.framesLine);
+        findings_.Add(m_uiRows < promised ? EFault::MissingRows : EFault::SurplusRows, outline_.framesLine);
 }
 
 void CRowCheck::MendCells()
@@ -166,9 +165,9 @@ void CRowCheck::MendCells()
     {
         const size_t line = m_kTable.LineOf(m_kBadCells[i].row);
         if (MeanOfNeighbours(m_kBadCells[i], values[i]))
-            m_kFindings.Add(EFault::NaN, line);
+            findings_.Add(EFault::NaN, line);
         else
-            m_kFindings.AddUnmended(EFault::NaN, line);
+            findings_.AddUnmended(EFault::NaN, line);
     }
     for (size_t i = 0; i < values.size(); ++i)
     {
@@ -206,7 +205,7 @@ bool CRowCheck::IsRotation(size_t column) const
 {
     const auto isBehind = [](size_t at, const OutlineJoint& joint) { return at < joint.firstColumn; };
     const auto joint =
-        std::prev(std::upper_bound(m_kOutline.joints.begin(), m_kOutline.joints.end(), column, isBehind));
+        std::prev(std::upper_bound(outline_.joints.begin(), outline_.joints.end(), column, isBehind));
     const size_t index = column - joint->firstColumn;
     return index < joint->channels.size() && joint->channels[index] >= kFirstRotation &&
            joint->channels[index] < kFirstScale;

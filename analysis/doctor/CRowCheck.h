@@ -29,7 +29,7 @@ struct RowPlan
 class CRowCheck
 {
 public:
-    CRowCheck(const BVHOutline& outline, CFindings& findings) : m_kOutline(outline), m_kFindings(findings) {}
+    CRowCheck(const BVHOutline& outline, CFindings& findings) : outline_(outline), findings_(findings) {}
 
     /// Reads from the cursor on.
     void Read(CLineCursor& lines);
@@ -62,8 +62,8 @@ private:
     void MendCells();
     bool MeanOfNeighbours(const BadCell& cell, float& value) const;
 
-    const BVHOutline& m_kOutline;
-    CFindings& m_kFindings;
+    const BVHOutline& outline_;
+    CFindings& findings_;
     CRowTable m_kTable;
     RowPlan m_kPlan;
     std::vector<float> m_kRow;

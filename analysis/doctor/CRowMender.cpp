@@ -19,11 +19,11 @@ constexpr size_t kWriteBytes = size_t{1} << 20;
 
 bool CRowMender::Write(std::string_view text, CSafeFile& file)
 {
-    CLineCursor lines(text, m_kOutline.rowsBegin, m_kOutline.rowsLine);
-    const size_t rows = m_kPlan.rowCount + m_kPlan.dropsLast;
+    CLineCursor lines(text, outline_.rowsBegin, outline_.rowsLine);
+    const size_t rows = plan_.rowCount + plan_.dropsLast;
     for (size_t row = 0; row < rows && lines.Next();)
     {
-        if (lines.IsBlank() || ++row > m_kPlan.rowCount)
+        if (lines.IsBlank() || ++row > plan_.rowCount)
             continue;
         AppendRow(lines.Line());
         const size_t end = lines.OffsetOf(lines.Line()) + lines.Line().size();
@@ -40,12 +40,12 @@ bool CRowMender::Write(std::string_view text, CSafeFile& file)
 void CRowMender::AppendRow(std::string_view row)
 {
     std::string points;
-    if (HasDecimalCommas(row, m_kOutline.columnCount))
+    if (HasDecimalCommas(row, outline_.columnCount))
     {
         points = WithPoints(row);
         row = points;
     }
-    const bool whole = CountTokens(row) >= m_kOutline.columnCount;
+    const bool whole = CountTokens(row) >= outline_.columnCount;
     if (whole && Changes())
         AppendValues(row);
     else
@@ -65,14 +65,14 @@ bool CRowMender::IsCellOfRow() const
 
 bool CRowMender::Changes() const
 {
-    return !m_kPlan.subtrahends.empty() || IsCellOfRow();
+    return !plan_.subtrahends.empty() || IsCellOfRow();
 }
 
 void CRowMender::AppendValues(std::string_view row)
 {
     const char* at = row.data();
     std::string_view rest = row;
-    for (size_t column = 0; column < m_kOutline.columnCount; ++column)
+    for (size_t column = 0; column < outline_.columnCount; ++column)
     {
         const std::string_view token = NextToken(rest);
         m_kOut.append(at, token.data()); // the blanks as they are
@@ -84,7 +84,7 @@ void CRowMender::AppendValues(std::string_view row)
 
 void CRowMender::AppendValue(std::string_view token, size_t column)
 {
-    const float less = m_kPlan.subtrahends.empty() ? 0.0f : m_kPlan.subtrahends[column];
+    const float less = plan_.subtrahends.empty() ? 0.0f : plan_.subtrahends[column];
     const bool mended = IsCellOf(column);
     double value = ParseDouble(token);
     while (IsCellOf(column)) // mended twice, the later value counts

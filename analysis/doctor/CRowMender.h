@@ -21,7 +21,7 @@ class CRowMender
 {
 public:
     CRowMender(const BVHOutline& outline, const RowPlan& plan, std::vector<MendedCell> cells)
-        : m_kOutline(outline), m_kPlan(plan), m_kCells(std::move(cells))
+        : outline_(outline), plan_(plan), m_kCells(std::move(cells))
     {
     }
 
@@ -36,8 +36,8 @@ private:
     bool IsCellOfRow() const;
     bool IsCellOf(size_t column) const;
 
-    const BVHOutline& m_kOutline;
-    const RowPlan& m_kPlan;
+    const BVHOutline& outline_;
+    const RowPlan& plan_;
     std::vector<MendedCell> m_kCells; // in the order of the rows
     size_t m_uiNextCell = 0;
     size_t m_uiWhole = 0; // rows so far that are whole, as the cells count them

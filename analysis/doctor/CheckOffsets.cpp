@@ -35,25 +35,25 @@ class CPositions
 {
 public:
     CPositions(const OutlineJoint& joint, const CRowTable& table)
-        : m_kJoint(joint), m_kTable(table), m_bThere(PositionColumns(joint, m_kColumns))
+        : joint_(joint), table_(table), m_bThere(PositionColumns(joint, m_kColumns))
     {
     }
 
-    bool AreThere() const { return m_bThere && m_kTable.RowCount() > 0; }
+    bool AreThere() const { return m_bThere && table_.RowCount() > 0; }
     const std::array<size_t, 3>& Columns() const { return m_kColumns; }
 
     bool RepeatOffset(size_t row) const
     {
-        return Vec3Length(At(row) - m_kJoint.offset) <= kRepeatShare * Vec3Length(m_kJoint.offset);
+        return Vec3Length(At(row) - joint_.offset) <= kRepeatShare * Vec3Length(joint_.offset);
     }
     // Whether they stay nearer to the offset than to its lack.
     bool StandForOffset() const
     {
         double toOffset = 0.0;
         double toZero = 0.0;
-        for (size_t row = 0; row < m_kTable.RowCount(); ++row)
+        for (size_t row = 0; row < table_.RowCount(); ++row)
         {
-            toOffset += FiniteOr0(Vec3Length(At(row) - m_kJoint.offset));
+            toOffset += FiniteOr0(Vec3Length(At(row) - joint_.offset));
             toZero += FiniteOr0(Vec3Length(At(row)));
         }
         return toOffset < toZero;
@@ -62,16 +62,16 @@ public:
     double MeanDistance(size_t axis) const
     {
         double sum = 0.0;
-        for (size_t row = 0; row < m_kTable.RowCount(); ++row)
-            sum += FiniteOr0(std::fabs(AlongAxis(At(row) - m_kJoint.offset, axis)));
-        return sum / static_cast<double>(m_kTable.RowCount());
+        for (size_t row = 0; row < table_.RowCount(); ++row)
+            sum += FiniteOr0(std::fabs(AlongAxis(At(row) - joint_.offset, axis)));
+        return sum / static_cast<double>(table_.RowCount());
     }
 
 private:
-    Vec3 At(size_t row) const { return PositionIn(m_kTable, row, m_kColumns); }
+    Vec3 At(size_t row) const { return PositionIn(table_, row, m_kColumns); }
 
-    const OutlineJoint& m_kJoint;
-    const CRowTable& m_kTable;
+    const OutlineJoint& joint_;
+    const CRowTable& table_;
     std::array<size_t, 3> m_kColumns{};
     bool m_bThere;
 };
@@ -80,7 +80,7 @@ class COffsetCheck
 {
 public:
     COffsetCheck(const BVHOutline& outline, const CRowTable& table, CFindings& findings)
-        : m_kOutline(outline), m_kTable(table), m_kFindings(findings)
+        : outline_(outline), table_(table), findings_(findings)
     {
     }
 
@@ -94,17 +94,17 @@ public:
 private:
     void CheckHip()
     {
-        const OutlineJoint& root = m_kOutline.joints.front();
-        const CPositions positions(root, m_kTable);
+        const OutlineJoint& root = outline_.joints.front();
+        const CPositions positions(root, table_);
         if (!positions.AreThere() || !HoldsHeight(root, positions))
             return;
-        m_kFindings.Add(EFault::DoubledHipOffset, root.offsetLine, root.name);
+        findings_.Add(EFault::DoubledHipOffset, root.offsetLine, root.name);
         Subtract(root, positions);
     }
     // Which way is up is not known here: some way the height must stand in both.
     bool HoldsHeight(const OutlineJoint& root, const CPositions& positions) const
     {
-        const double reach = SkeletonReach(m_kOutline);
+        const double reach = SkeletonReach(outline_);
         for (size_t axis = 0; axis < 3; ++axis)
         {
             const double height = std::fabs(AlongAxis(root.offset, axis));
@@ -117,14 +117,14 @@ private:
     void CheckBones()
     {
         const OutlineJoint* first = nullptr;
-        for (size_t row = 0; row < std::min(kProbeRows, m_kTable.RowCount()) && !first; ++row)
+        for (size_t row = 0; row < std::min(kProbeRows, table_.RowCount()) && !first; ++row)
             first = FirstRepeatingIn(row);
         if (!first)
             return;
-        m_kFindings.Add(EFault::DoubledOffset, first->offsetLine, first->name);
-        for (const OutlineJoint& joint : m_kOutline.joints)
+        findings_.Add(EFault::DoubledOffset, first->offsetLine, first->name);
+        for (const OutlineJoint& joint : outline_.joints)
         {
-            const CPositions positions(joint, m_kTable);
+            const CPositions positions(joint, table_);
             if (IsCandidate(joint, positions) && positions.StandForOffset())
                 Subtract(joint, positions);
         }
@@ -139,9 +139,9 @@ private:
         const OutlineJoint* first = nullptr;
         size_t candidates = 0;
         size_t repeating = 0;
-        for (const OutlineJoint& joint : m_kOutline.joints)
+        for (const OutlineJoint& joint : outline_.joints)
         {
-            const CPositions positions(joint, m_kTable);
+            const CPositions positions(joint, table_);
             if (!IsCandidate(joint, positions))
                 continue;
             ++candidates;
@@ -154,14 +154,14 @@ private:
     }
     void Subtract(const OutlineJoint& joint, const CPositions& positions)
     {
-        m_kSubtrahends.resize(m_kTable.ColumnCount());
+        m_kSubtrahends.resize(table_.ColumnCount());
         for (size_t axis = 0; axis < 3; ++axis)
             m_kSubtrahends[positions.Columns()[axis]] = AlongAxis(joint.offset, axis);
     }
 
-    const BVHOutline& m_kOutline;
-    const CRowTable& m_kTable;
-    CFindings& m_kFindings;
+    const BVHOutline& outline_;
+    const CRowTable& table_;
+    CFindings& findings_;
     std::vector<float> m_kSubtrahends;
 };
 

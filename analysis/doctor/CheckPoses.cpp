@@ -56,28 +56,28 @@ class CPoseCheck
 {
 public:
     CPoseCheck(CNode& root, const BVHOutline* outline, CFindings& findings)
-        : m_kRoot(root), m_pkOutline(outline), m_kFindings(findings)
+        : root_(root), m_pkOutline(outline), findings_(findings)
     {
     }
 
     void CheckRoot()
     {
-        const CKeyframeControl* const track = TrackOf(m_kRoot);
+        const CKeyframeControl* const track = TrackOf(root_);
         if (!track || !StandsStill(*track))
             return;
-        const double least = kLeastTravelShare * LongestBone(NodesOf(m_kRoot));
-        for (const CNode* child : ChildNodes(m_kRoot))
+        const double least = kLeastTravelShare * LongestBone(NodesOf(root_));
+        for (const CNode* child : ChildNodes(root_))
         {
             const CKeyframeControl* const below = TrackOf(*child);
             if (below && least > 0.0 && Travel(*below) >= least)
-                return Add(EFault::StillRoot, m_kRoot);
+                return Add(EFault::StillRoot, root_);
         }
     }
 
     // What the names say of left and right, against the places of the legs or arms.
     void CheckSides()
     {
-        const CBodyMap named = FindBodyByNames(m_kRoot);
+        const CBodyMap named = FindBodyByNames(root_);
         const std::vector<BodyDoubt> doubts = CheckBody(named);
         const auto doubt = std::ranges::find(doubts, EBodyDoubt::SidesSwapped, &BodyDoubt::kind);
         const CNode* const joint = doubt == doubts.end() ? nullptr : JointAt(named, doubt->place);
@@ -90,17 +90,16 @@ public:
     {
         const std::optional<Gait> gait = FindGait(paths, up, facts.leg);
         const double rate = 1.0 / facts.frameSeconds;
-        if (!gait || !std::isfinite(rate) || !IsOtherRate(*gait, rate) ||
-            m_kFindings.Has(EFault::RateForTime))
+        if (!gait || !std::isfinite(rate) || !IsOtherRate(*gait, rate) || findings_.Has(EFault::RateForTime))
             return;
-        m_kFindings.Add(EFault::WrongRate, m_pkOutline ? m_pkOutline->frameTimeLine : 0,
-                        RateWords(rate, gait->UsualRate()));
+        findings_.Add(EFault::WrongRate, m_pkOutline ? m_pkOutline->frameTimeLine : 0,
+                      RateWords(rate, gait->UsualRate()));
     }
 
 private:
     void Add(EFault fault, const CNode& node)
     {
-        m_kFindings.Add(fault, LineOf(node), std::string(node.NameView()));
+        findings_.Add(fault, LineOf(node), std::string(node.NameView()));
     }
     size_t LineOf(const CNode& node) const
     {
@@ -116,9 +115,9 @@ private:
                std::to_string(std::lround(usual));
     }
 
-    CNode& m_kRoot;
+    CNode& root_;
     const BVHOutline* m_pkOutline;
-    CFindings& m_kFindings;
+    CFindings& findings_;
 };
 
 EBodySource SourceOf(const FoundBody& found)

@@ -25,18 +25,18 @@ class CSpikeCheck
 {
 public:
     CSpikeCheck(const BVHOutline& outline, CRowTable& table, CFindings& findings)
-        : m_kOutline(outline), m_kTable(table), m_kFindings(findings)
+        : outline_(outline), table_(table), findings_(findings)
     {
     }
 
     void Run()
     {
-        const double least = kLeastJumpShare * SkeletonReach(m_kOutline);
-        for (const OutlineJoint& joint : m_kOutline.joints)
+        const double least = kLeastJumpShare * SkeletonReach(outline_);
+        for (const OutlineJoint& joint : outline_.joints)
         {
             const std::vector<size_t> rotations = RotationColumns(joint);
             if (MayJump(rotations))
-                Treat(joint, FindSpikes(RotationsOf(joint, m_kTable)), rotations);
+                Treat(joint, FindSpikes(RotationsOf(joint, table_)), rotations);
             std::array<size_t, 3> positions{};
             if (PositionColumns(joint, positions) && least > 0.0)
                 Treat(joint, FindSpikes(PositionsIn(positions), least), positions);
@@ -50,11 +50,11 @@ private:
     {
         if (columns.empty())
             return false;
-        for (size_t row = 1; row < m_kTable.RowCount(); ++row)
+        for (size_t row = 1; row < table_.RowCount(); ++row)
         {
             float turn = 0.0f;
             for (const size_t column : columns)
-                turn += std::fabs(m_kTable.At(row, column) - m_kTable.At(row - 1, column));
+                turn += std::fabs(table_.At(row, column) - table_.At(row - 1, column));
             if (turn >= static_cast<float>(kLeastSpikeDegrees))
                 return true;
         }
@@ -63,9 +63,9 @@ private:
     std::vector<Vec3> PositionsIn(const std::array<size_t, 3>& columns) const
     {
         std::vector<Vec3> positions;
-        positions.reserve(m_kTable.RowCount());
-        for (size_t row = 0; row < m_kTable.RowCount(); ++row)
-            positions.push_back(PositionIn(m_kTable, row, columns));
+        positions.reserve(table_.RowCount());
+        for (size_t row = 0; row < table_.RowCount(); ++row)
+            positions.push_back(PositionIn(table_, row, columns));
         return positions;
     }
 
@@ -73,13 +73,13 @@ private:
     {
         for (const Spike& spike : spikes)
         {
-            const size_t line = m_kTable.LineOf(spike.first);
+            const size_t line = table_.LineOf(spike.first);
             if (spike.count > 1)
             {
-                m_kFindings.AddUnmended(EFault::Spike, line, joint.name);
+                findings_.AddUnmended(EFault::Spike, line, joint.name);
                 continue;
             }
-            m_kFindings.Add(EFault::Spike, line, joint.name);
+            findings_.Add(EFault::Spike, line, joint.name);
             Mend(joint, spike.first, columns);
         }
     }
@@ -90,23 +90,23 @@ private:
     {
         const bool rotation = joint.channels[columns[0] - joint.firstColumn] >= 3;
         const auto behind = [&](size_t column) {
-            const float before = m_kTable.At(row - 1, column);
-            const float value = m_kTable.At(row + 1, column);
+            const float before = table_.At(row - 1, column);
+            const float value = table_.At(row + 1, column);
             return rotation ? NearestTurn(value, before) : value;
         };
         const bool near = std::ranges::all_of(columns, [&](size_t column) {
-            return !rotation || std::fabs(behind(column) - m_kTable.At(row - 1, column)) <= kMostTurn;
+            return !rotation || std::fabs(behind(column) - table_.At(row - 1, column)) <= kMostTurn;
         });
         for (const size_t column : columns)
         {
-            const float before = m_kTable.At(row - 1, column);
-            m_kTable.Mend(row, column, near ? before + 0.5f * (behind(column) - before) : before);
+            const float before = table_.At(row - 1, column);
+            table_.Mend(row, column, near ? before + 0.5f * (behind(column) - before) : before);
         }
     }
 
-    const BVHOutline& m_kOutline;
-    CRowTable& m_kTable;
-    CFindings& m_kFindings;
+    const BVHOutline& outline_;
+    CRowTable& table_;
+    CFindings& findings_;
 };
 
 } // namespace

@@ -70,7 +70,7 @@ class CCleaner
 {
 public:
     CCleaner(std::string_view text, std::string& clean, CFindings& findings)
-        : m_kRest(text), m_kText(text), m_kClean(clean), m_kFindings(findings),
+        : m_kRest(text), m_kText(text), clean_(clean), findings_(findings),
           m_bLineFeeds(text.find('\n') != text.npos)
     {
     }
@@ -85,7 +85,7 @@ public:
             if (!m_kRest.empty())
                 Judge();
         }
-        return m_bChanged ? m_kClean : m_kText;
+        return m_bChanged ? clean_ : m_kText;
     }
 
 private:
@@ -129,24 +129,24 @@ private:
         const std::string_view kept = m_kRest.substr(0, length);
         m_uiLine += static_cast<size_t>(std::ranges::count(kept, '\n'));
         if (m_bChanged)
-            m_kClean += kept;
+            clean_ += kept;
         m_kRest.remove_prefix(length);
     }
     void Replace(EFault fault, size_t length, std::string_view instead, std::string_view what)
     {
         if (!m_bChanged)
-            m_kClean.assign(m_kText.substr(0, m_kText.size() - m_kRest.size()));
+            clean_.assign(m_kText.substr(0, m_kText.size() - m_kRest.size()));
         m_bChanged = true;
-        m_kClean += instead;
-        m_kFindings.Add(fault, m_uiLine, std::string(what));
+        clean_ += instead;
+        findings_.Add(fault, m_uiLine, std::string(what));
         m_uiLine += instead == "\n";
         m_kRest.remove_prefix(length);
     }
 
     std::string_view m_kRest;
     std::string_view m_kText;
-    std::string& m_kClean;
-    CFindings& m_kFindings;
+    std::string& clean_;
+    CFindings& findings_;
     bool m_bLineFeeds;
     size_t m_uiLine = 1;
     bool m_bChanged = false;

@@ -55,7 +55,7 @@ struct Spread
 class CStepSearch
 {
 public:
-    CStepSearch(const BodyPaths& paths, const Vec3& up, double leg) : m_kPaths(paths), m_kUp(up), m_fLeg(leg)
+    CStepSearch(const BodyPaths& paths, const Vec3& up, double leg) : paths_(paths), m_kUp(up), m_fLeg(leg)
     {
         for (size_t frame = 0; frame < paths.FrameCount(); ++frame)
             m_kApart.push_back(GroundDistance(paths.feet[0][frame], paths.feet[1][frame]));
@@ -71,8 +71,7 @@ public:
         for (size_t i = 1; i < m_kSteps.size(); ++i)
         {
             frames.push_back(static_cast<double>(m_kSteps[i] - m_kSteps[i - 1]));
-            lengths.push_back(GroundDistance(m_kPaths.hip[m_kSteps[i - 1]], m_kPaths.hip[m_kSteps[i]]) /
-                              m_fLeg);
+            lengths.push_back(GroundDistance(paths_.hip[m_kSteps[i - 1]], paths_.hip[m_kSteps[i]]) / m_fLeg);
         }
         const Spread time(frames);
         const Spread length(lengths);
@@ -132,12 +131,12 @@ private:
         const size_t around = std::max<size_t>((end - begin) / 8, 1);
         const size_t from = passing - std::min(passing, around);
         const size_t to = std::min(passing + around, m_kApart.size() - 1);
-        const double left = GroundDistance(m_kPaths.feet[0][from], m_kPaths.feet[0][to]);
-        const double right = GroundDistance(m_kPaths.feet[1][from], m_kPaths.feet[1][to]);
+        const double left = GroundDistance(paths_.feet[0][from], paths_.feet[0][to]);
+        const double right = GroundDistance(paths_.feet[1][from], paths_.feet[1][to]);
         return std::min(left, right) <= kStandingShare * std::max(left, right);
     }
 
-    const BodyPaths& m_kPaths;
+    const BodyPaths& paths_;
     Vec3 m_kUp;
     double m_fLeg;
     std::vector<double> m_kApart; // the feet, over the ground

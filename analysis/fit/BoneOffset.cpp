@@ -62,7 +62,7 @@ float Size(const Degrees& angles)
 }
 
 // How far the numbers are from a rotation, in degrees; `axis` counts for all, the other directions a little.
-double Distance(const CRowNumbers& numbers, const Mat3& rotation, const Vec3& axis)
+double Distance(const RowNumbers& numbers, const Mat3& rotation, const Vec3& axis)
 {
     const Mat3 offset = OffsetOf(numbers);
     double twist = 0.0;
@@ -73,25 +73,25 @@ double Distance(const CRowNumbers& numbers, const Mat3& rotation, const Vec3& ax
 
 } // namespace
 
-Mat3 OffsetOf(const CRowNumbers& numbers)
+Mat3 OffsetOf(const RowNumbers& numbers)
 {
     const auto& [x, y, z] = numbers.rotation;
     return OffsetRotation({static_cast<float>(x), static_cast<float>(y), static_cast<float>(z)},
                           AxisMatrix(numbers.axes));
 }
 
-CRowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis)
+RowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis)
 {
     static const std::vector<AxisCodes> kRotations = AxisRotations();
     const auto size = [&](const AxisCodes& codes) { return std::round(Size(AnglesBehind(codes, rotation))); };
     const AxisCodes codes = *std::ranges::min_element(kRotations, {}, size);
     const Degrees angles = AnglesBehind(codes, rotation);
-    CRowNumbers best;
+    RowNumbers best;
     double least = 360.0;
     for (int step = 0; step < 27; ++step)
     {
         const std::array<int, 3> steps{step % 3 - 1, step / 3 % 3 - 1, step / 9 - 1};
-        CRowNumbers numbers{{}, codes};
+        RowNumbers numbers{{}, codes};
         for (size_t i = 0; i < steps.size(); ++i)
             numbers.rotation[i] = static_cast<int>(std::lround(angles[i])) + steps[i];
         const double distance = Distance(numbers, rotation, axis);

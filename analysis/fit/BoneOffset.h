@@ -7,11 +7,11 @@
 namespace gw {
 
 /// The rotation that a row's numbers put before a source bone's.
-Mat3 OffsetOf(const CRowNumbers& numbers);
+Mat3 OffsetOf(const RowNumbers& numbers);
 
 /// A row's numbers for a rotation: axis codes that leave the least to turn, and whole degrees. Of all numbers
 /// near by those that best take `axis`, a direction of the target bone, to where the rotation takes it; what
 /// the degrees cannot hold goes into the turn about the bone.
-CRowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis);
+RowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis);
 
 } // namespace gw

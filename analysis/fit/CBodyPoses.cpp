@@ -34,7 +34,7 @@ Vec3 Middle(const Vec3& a, const Vec3& b)
 } // namespace
 
 CBodyPoses::CBodyPoses(const CBodyMap& body, const BodyStance& rest)
-    : m_kBody(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
+    : body_(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
 {
     for (const EBodySide side : kBodySides)
     {
@@ -64,7 +64,7 @@ void CBodyPoses::Watch(CNode* node)
 
 void CBodyPoses::PlanFrames()
 {
-    const CKeyframeControl* const track = TrackOf(*m_kBody.Leg(EBodySide::Left).thigh);
+    const CKeyframeControl* const track = TrackOf(*body_.Leg(EBodySide::Left).thigh);
     const size_t count = track ? track->m_kKeyTimes.size() : 0;
     for (size_t i = 0; i < std::min(count, kFrameCount); ++i)
         m_kFrames.push_back(static_cast<double>(i * (count - 1) / std::max<size_t>(kFrameCount - 1, 1)));
@@ -89,10 +89,10 @@ Mat4 CBodyPoses::BoneWorld(const CNode& node) const
 
 Mat3 CBodyPoses::Axes() const
 {
-    const Vec3 left = Place(*m_kBody.Leg(EBodySide::Left).thigh);
-    const Vec3 right = Place(*m_kBody.Leg(EBodySide::Right).thigh);
+    const Vec3 left = Place(*body_.Leg(EBodySide::Left).thigh);
+    const Vec3 right = Place(*body_.Leg(EBodySide::Right).thigh);
     const Vec3 arms =
-        Middle(Place(*m_kBody.Arm(EBodySide::Left).upperArm), Place(*m_kBody.Arm(EBodySide::Right).upperArm));
+        Middle(Place(*body_.Arm(EBodySide::Left).upperArm), Place(*body_.Arm(EBodySide::Right).upperArm));
     const Vec3 up = Vec3Normalized(arms - Middle(left, right));
     const Vec3 forward = Vec3Normalized(Vec3Cross(left - right, up));
     Mat3 axes;

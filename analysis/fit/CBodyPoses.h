@@ -45,7 +45,7 @@ private:
     Mat4 World(const CNode& node) const;
     void PlanFrames();
 
-    const CBodyMap& m_kBody;
+    const CBodyMap& body_;
     CPoseSampler m_kSampler;
     std::vector<double> m_kFrames; // none for the rest pose
     std::vector<Kept> m_kKept;

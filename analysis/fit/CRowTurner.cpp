@@ -38,18 +38,18 @@ bool IsGivenBack(const Mat3& rotation)
 
 CRowTurner::CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const CTargetBones& target,
                        const RowJoints& joints)
-    : m_kTree(tree), m_kPoses(poses), m_kTarget(target), m_kJoints(joints), m_uiReference(poses.Reference()),
+    : tree_(tree), poses_(poses), target_(target), joints_(joints), m_uiReference(poses.Reference()),
       m_kFacing(poses.Facing(m_uiReference))
 {
     for (size_t row = 0; row < kHostRowCount; ++row)
     {
-        if (m_kJoints[row] != CJointTree::kNone && kHostRows[row].aim != EHostAim::None)
+        if (joints_[row] != CJointTree::kNone && kHostRows[row].aim != EHostAim::None)
             Turn(row);
     }
     // A bone that is turned may itself come to hang at a pole, so the bones above follow.
     for (size_t row = kHostRowCount; row-- > 0;)
     {
-        if (m_kJoints[row] != CJointTree::kNone)
+        if (joints_[row] != CJointTree::kNone)
             KeepOffPoles(row);
     }
 }
@@ -57,7 +57,7 @@ CRowTurner::CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const 
 Vec3 CRowTurner::Axis(size_t row) const
 {
     const HostRow& host = kHostRows[row];
-    return host.aim == EHostAim::Child ? m_kTarget.ChildAxis(host.target) : kVec3UnitY;
+    return host.aim == EHostAim::Child ? target_.ChildAxis(host.target) : kVec3UnitY;
 }
 
 // The joint that a source bone's direction leads to, or none.
@@ -65,12 +65,12 @@ int CRowTurner::AimOf(size_t row) const
 {
     const HostRow& host = kHostRows[row];
     if (host.aim == EHostAim::Child)
-        return m_kPoses.JointBelow(m_kJoints[row], CJointTree::kNone);
+        return poses_.JointBelow(joints_[row], CJointTree::kNone);
     const size_t last = row + static_cast<size_t>(host.next);
     for (size_t next = row + 1; host.aim == EHostAim::Next && next <= last; ++next)
     {
-        if (m_kJoints[next] != CJointTree::kNone)
-            return m_kPoses.JointBelow(m_kJoints[row], m_kJoints[next]);
+        if (joints_[next] != CJointTree::kNone)
+            return poses_.JointBelow(joints_[row], joints_[next]);
     }
     return CJointTree::kNone;
 }
@@ -78,21 +78,21 @@ int CRowTurner::AimOf(size_t row) const
 // Where a source bone points at rest, in its own space.
 Vec3 CRowTurner::RestAim(size_t row, int aim) const
 {
-    const int joint = m_kJoints[row];
-    return Turned(m_kPoses.Direction(0, joint, aim), Mat3Transpose(m_kPoses.BoneTurn(0, joint)));
+    const int joint = joints_[row];
+    return Turned(poses_.Direction(0, joint, aim), Mat3Transpose(poses_.BoneTurn(0, joint)));
 }
 
 // Where a bone should point in the reference pose; nothing where it should stand as it does at rest.
 std::optional<Vec3> CRowTurner::ReferenceDirection(size_t row, int aim) const
 {
-    const int joint = m_kJoints[row];
+    const int joint = joints_[row];
     if (aim != CJointTree::kNone)
-        return m_kPoses.Direction(m_uiReference, joint, aim);
+        return poses_.Direction(m_uiReference, joint, aim);
     if (kHostRows[row].aim != EHostAim::Hand)
         return std::nullopt;
     Vec3 knuckles = kVec3Zero;
-    for (const int child : m_kTree.Children(joint))
-        knuckles = knuckles + m_kPoses.Direction(m_uiReference, joint, child);
+    for (const int child : tree_.Children(joint))
+        knuckles = knuckles + poses_.Direction(m_uiReference, joint, child);
     const bool known = Vec3Length(knuckles) > 0.0;
     return known ? Vec3Normalized(knuckles) : ReferenceDirection(row - 1, AimOf(row - 1));
 }
@@ -101,10 +101,10 @@ void CRowTurner::Turn(size_t row)
 {
     const int aim = AimOf(row);
     const Vec3 axis = Axis(row);
-    Mat3 turn = m_kTarget.RestTurn(kHostRows[row].target) * m_kFacing;
+    Mat3 turn = target_.RestTurn(kHostRows[row].target) * m_kFacing;
     if (const std::optional<Vec3> direction = ReferenceDirection(row, aim))
         turn = turn * LeastSwing(Turned(axis, turn), *direction);
-    Mat3 offset = turn * Mat3Transpose(m_kPoses.BoneTurn(m_uiReference, m_kJoints[row]));
+    Mat3 offset = turn * Mat3Transpose(poses_.BoneTurn(m_uiReference, joints_[row]));
     // A joint in between that turns by itself moves the aim; the rest pose is what counts.
     if (aim != CJointTree::kNone)
         offset = offset * LeastSwing(Turned(axis, offset), RestAim(row, aim));
@@ -113,7 +113,7 @@ void CRowTurner::Turn(size_t row)
 
 std::optional<double> CRowTurner::RestError(size_t row) const
 {
-    const int aim = m_kJoints[row] == CJointTree::kNone ? CJointTree::kNone : AimOf(row);
+    const int aim = joints_[row] == CJointTree::kNone ? CJointTree::kNone : AimOf(row);
     if (aim == CJointTree::kNone)
         return std::nullopt;
     return AngleBetween(Turned(Axis(row), OffsetOf(m_kNumbers[row])), RestAim(row, aim));
@@ -122,12 +122,12 @@ std::optional<double> CRowTurner::RestError(size_t row) const
 // Whether a child's rotation against its parent's gets lost: a conversion cannot decompose it before the
 // offset (see CPoseMatcher), or the angles in the result's file do not give it back behind it. Both happen
 // where the sine of a middle angle is 1, and bones that are stiff in the source stay there for ever.
-bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const
+bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers, size_t child) const
 {
     for (const size_t stance : {size_t{0}, m_uiReference})
     {
-        const Mat3 above = OffsetOf(numbers) * m_kPoses.BoneTurn(stance, m_kJoints[row]);
-        const Mat3 local = m_kPoses.BoneTurn(stance, m_kJoints[child]) * Mat3Transpose(above);
+        const Mat3 above = OffsetOf(numbers) * poses_.BoneTurn(stance, joints_[row]);
+        const Mat3 local = poses_.BoneTurn(stance, joints_[child]) * Mat3Transpose(above);
         if (IsSineOne(local, kHostRows[child]) || !IsGivenBack(OffsetOf(m_kNumbers[child]) * local))
             return true;
     }
@@ -136,25 +136,25 @@ bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) 
 
 // The same for bones that hang from no row: the root, and thighs, whose pelvis bones stay as they are at
 // rest.
-bool CRowTurner::IsAtPole(size_t row, const CRowNumbers& numbers) const
+bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers) const
 {
     constexpr size_t kHip = 0;
-    const bool isThigh = kHostRows[row].joint == EBodyJoint::Thigh && m_kJoints[kHip] != CJointTree::kNone;
+    const bool isThigh = kHostRows[row].joint == EBodyJoint::Thigh && joints_[kHip] != CJointTree::kNone;
     if (row != kHip && !isThigh)
         return false;
     for (const size_t stance : {size_t{0}, m_uiReference})
     {
-        const Mat3 world = OffsetOf(numbers) * m_kPoses.BoneTurn(stance, m_kJoints[row]);
-        const Mat3 hip = OffsetOf(m_kNumbers[kHip]) * m_kPoses.BoneTurn(stance, m_kJoints[kHip]);
-        const Mat3 pelvis = m_kTarget.RestTurn(kHostRows[row - 1 * isThigh].target) *
-                            Mat3Transpose(m_kTarget.RestTurn(kHostRows[kHip].target));
+        const Mat3 world = OffsetOf(numbers) * poses_.BoneTurn(stance, joints_[row]);
+        const Mat3 hip = OffsetOf(m_kNumbers[kHip]) * poses_.BoneTurn(stance, joints_[kHip]);
+        const Mat3 pelvis = target_.RestTurn(kHostRows[row - 1 * isThigh].target) *
+                            Mat3Transpose(target_.RestTurn(kHostRows[kHip].target));
         if (!IsGivenBack(isThigh ? world * Mat3Transpose(pelvis * hip) : world))
             return true;
     }
     return false;
 }
 
-bool CRowTurner::IsNearPole(size_t row, const CRowNumbers& numbers) const
+bool CRowTurner::IsNearPole(size_t row, const RowNumbers& numbers) const
 {
     if (IsAtPole(row, numbers))
         return true;
@@ -162,7 +162,7 @@ bool CRowTurner::IsNearPole(size_t row, const CRowNumbers& numbers) const
     {
         const HostRow& host = kHostRows[child];
         const bool isChild = host.parent == static_cast<int>(child - row);
-        if (isChild && m_kJoints[child] != CJointTree::kNone && IsAtPole(row, numbers, child))
+        if (isChild && joints_[child] != CJointTree::kNone && IsAtPole(row, numbers, child))
             return true;
     }
     return false;
@@ -178,7 +178,7 @@ void CRowTurner::KeepOffPoles(size_t row)
     for (const float nudge : kNudges)
     {
         const Mat3 turn = Mat3FromAxisAngle(axis, nudge * kDegreesToRadians);
-        const CRowNumbers numbers = NearestOffset(turn * OffsetOf(m_kNumbers[row]), axis);
+        const RowNumbers numbers = NearestOffset(turn * OffsetOf(m_kNumbers[row]), axis);
         if (IsNearPole(row, numbers))
             continue;
         m_kNumbers[row] = numbers;

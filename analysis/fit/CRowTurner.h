@@ -25,7 +25,7 @@ public:
     CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const CTargetBones& target,
                const RowJoints& joints);
 
-    const CRowNumbers& Numbers(size_t row) const { return m_kNumbers[row]; }
+    const RowNumbers& Numbers(size_t row) const { return m_kNumbers[row]; }
     /// Whether a row is turned about its bone by a degree or two more than it needs to, to keep a bone below
     /// it from where a conversion could not follow.
     bool IsNudged(size_t row) const { return m_kNudged[row]; }
@@ -36,21 +36,21 @@ public:
 private:
     void Turn(size_t row);
     void KeepOffPoles(size_t row);
-    bool IsNearPole(size_t row, const CRowNumbers& numbers) const;
-    bool IsAtPole(size_t row, const CRowNumbers& numbers) const;
-    bool IsAtPole(size_t row, const CRowNumbers& numbers, size_t child) const;
+    bool IsNearPole(size_t row, const RowNumbers& numbers) const;
+    bool IsAtPole(size_t row, const RowNumbers& numbers) const;
+    bool IsAtPole(size_t row, const RowNumbers& numbers, size_t child) const;
     int AimOf(size_t row) const;
     Vec3 Axis(size_t row) const;
     Vec3 RestAim(size_t row, int aim) const;
     std::optional<Vec3> ReferenceDirection(size_t row, int aim) const;
 
-    const CJointTree& m_kTree;
-    const CSourcePoses& m_kPoses;
-    const CTargetBones& m_kTarget;
-    const RowJoints& m_kJoints;
+    const CJointTree& tree_;
+    const CSourcePoses& poses_;
+    const CTargetBones& target_;
+    const RowJoints& joints_;
     size_t m_uiReference;
     Mat3 m_kFacing;
-    std::array<CRowNumbers, kHostRowCount> m_kNumbers{};
+    std::array<RowNumbers, kHostRowCount> m_kNumbers{};
     std::array<bool, kHostRowCount> m_kNudged{};
 };
 

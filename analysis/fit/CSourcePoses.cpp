@@ -37,7 +37,7 @@ size_t CSourcePoses::Reference() const
 {
     for (size_t stance = 0; stance < Count(); ++stance)
     {
-        if (HasLegsTogether(StanceIn(m_kTree, stance, m_kBody)))
+        if (HasLegsTogether(StanceIn(tree_, stance, body_)))
             return stance;
     }
     return std::min<size_t>(1, Count() - 1);
@@ -45,7 +45,7 @@ size_t CSourcePoses::Reference() const
 
 Mat3 CSourcePoses::Facing(size_t stance) const
 {
-    const BodyStance axes = StanceIn(m_kTree, stance, m_kBody);
+    const BodyStance axes = StanceIn(tree_, stance, body_);
     Mat3 facing;
     facing.SetRow(0, axes.left);
     facing.SetRow(1, axes.up);
@@ -55,25 +55,25 @@ Mat3 CSourcePoses::Facing(size_t stance) const
 
 Mat3 CSourcePoses::BoneTurn(size_t stance, int joint) const
 {
-    const CBoneMesh* mesh = FindBoneMesh(*m_kTree.Node(joint));
-    const Mat3& turn = m_kTree.Stances().Turn(stance, joint);
+    const CBoneMesh* mesh = FindBoneMesh(*tree_.Node(joint));
+    const Mat3& turn = tree_.Stances().Turn(stance, joint);
     return mesh ? NormalizedRows(mesh->m_kMatrix) * turn : turn;
 }
 
 Vec3 CSourcePoses::Direction(size_t stance, int from, int to) const
 {
-    const CStances& stances = m_kTree.Stances();
+    const CStances& stances = tree_.Stances();
     return Vec3Normalized(stances.Place(stance, to) - stances.Place(stance, from));
 }
 
 int CSourcePoses::JointBelow(int joint, int goal) const
 {
-    const CStances& stances = m_kTree.Stances();
-    const std::vector<int> way = m_kTree.WayDown(joint, goal);
+    const CStances& stances = tree_.Stances();
+    const std::vector<int> way = tree_.WayDown(joint, goal);
     int at = joint;
     for (size_t step = 0;; ++step)
     {
-        const std::vector<int>& children = m_kTree.Children(at);
+        const std::vector<int>& children = tree_.Children(at);
         if (step >= way.size() && children.empty())
             return CJointTree::kNone;
         at = step < way.size() ? way[step] : children.front();

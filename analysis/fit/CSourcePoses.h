@@ -11,9 +11,9 @@ namespace gw {
 class CSourcePoses
 {
 public:
-    CSourcePoses(const CJointTree& tree, const CBodyMap& body) : m_kTree(tree), m_kBody(body) {}
+    CSourcePoses(const CJointTree& tree, const CBodyMap& body) : tree_(tree), body_(body) {}
 
-    bool StandsAtRest() const { return StanceIn(m_kTree, 0, m_kBody).Stands(); }
+    bool StandsAtRest() const { return StanceIn(tree_, 0, body_).Stands(); }
     /// The first pose that is a stance with the legs together, the rest pose before all others, else the
     /// first frame.
     size_t Reference() const;
@@ -29,10 +29,10 @@ public:
     int JointBelow(int joint, int goal) const;
 
 private:
-    size_t Count() const { return m_kTree.Stances().Count(); }
+    size_t Count() const { return tree_.Stances().Count(); }
 
-    const CJointTree& m_kTree;
-    const CBodyMap& m_kBody;
+    const CJointTree& tree_;
+    const CBodyMap& body_;
 };
 
 } // namespace gw

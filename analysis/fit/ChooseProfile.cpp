@@ -26,7 +26,7 @@ class CSkeletons
 {
 public:
     CSkeletons(CNode& source, CNode& target)
-        : m_kSource(source), m_kTargetNodes(target), m_kSourceNames(&source), m_kTargetNames(&target)
+        : source_(source), m_kTargetNodes(target), m_kSourceNames(&source), m_kTargetNames(&target)
     {
     }
 
@@ -39,16 +39,16 @@ private:
     // What takes a walk over poses waits for the first profile that fits.
     const SourceBody& Body()
     {
-        if (!m_kBody)
-            m_kBody.emplace(m_kSource);
-        return *m_kBody;
+        if (!body_)
+            body_.emplace(source_);
+        return *body_;
     }
 
-    CNode& m_kSource;
+    CNode& source_;
     CNodeNames m_kTargetNodes;
     CBoneNames m_kSourceNames;
     CBoneNames m_kTargetNames;
-    std::optional<SourceBody> m_kBody;
+    std::optional<SourceBody> body_;
 };
 
 void CSkeletons::Match(ProfileChoice& choice) const

@@ -12,7 +12,7 @@ namespace gw {
 
 namespace {
 
-void TakeLine(const CProfileLine& line, ProfileRows& profile)
+void TakeLine(const ProfileLine& line, ProfileRows& profile)
 {
     switch (line.kind)
     {
@@ -47,7 +47,7 @@ ProfileRows RowsOfText(std::string_view text)
     CProfileReader reader(text);
     ProfileRows profile;
     profile.name = reader.Name();
-    for (CProfileLine line; reader.Next(line);)
+    for (ProfileLine line; reader.Next(line);)
         TakeLine(line, profile);
     profile.rows.AddPelvisRows();
     return profile;
@@ -61,7 +61,7 @@ bool MayFit(std::string_view text, const CBoneNames& sources)
         return std::ranges::any_of(targets,
                                    [&](const std::string& known) { return EqualNoCase(known, target); });
     };
-    for (CProfileLine line; reader.Next(line);)
+    for (ProfileLine line; reader.Next(line);)
     {
         if (line.kind != EProfileLine::Mapping && line.kind != EProfileLine::Fixed)
             continue;

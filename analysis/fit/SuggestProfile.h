@@ -37,7 +37,7 @@ struct SuggestedRow
     CNode* source = nullptr;
     BodyPlace place; ///< what the source is in its body
     ESuggestedRow kind = ESuggestedRow::Turned;
-    CRowNumbers numbers;
+    RowNumbers numbers;
     EBodyEvidence evidence = EBodyEvidence::None;
     ERowSureness sureness = ERowSureness::Sure;
     std::vector<EBodyDoubt> doubts; ///< that concern the joint

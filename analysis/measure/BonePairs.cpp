@@ -29,7 +29,7 @@ bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* res
     const CBoneNames sources(sourceRoot);
     const CBoneNames targets(resultRoot);
     CProfileReader reader(text);
-    for (CProfileLine line; reader.Next(line);)
+    for (ProfileLine line; reader.Next(line);)
     {
         if (line.kind != EProfileLine::Mapping)
             continue;

@@ -49,7 +49,7 @@ void MoveToStart(std::vector<Vec3>& places, double floor, double scale)
 
 CDetailRecorder::CDetailRecorder(ConversionDetail& detail, std::span<const BonePair> pairs,
                                  const CSourceTable& sources, const CNode* resultRoot)
-    : m_kDetail(detail), m_pkSourceRoot(sources.SourceOf(resultRoot)), m_pkResultRoot(resultRoot)
+    : detail_(detail), m_pkSourceRoot(sources.SourceOf(resultRoot)), m_pkResultRoot(resultRoot)
 {
     for (const BonePair& pair : pairs)
     {
@@ -68,8 +68,8 @@ void CDetailRecorder::AddMainBone(const BonePair& pair, const CSourceTable& sour
         ends = {nullptr, nullptr, pair.source};
     }
     m_kMeters.emplace_back(pair, ends);
-    m_kDetail.mainBones.emplace_back(pair.target->NameView());
-    m_kDetail.mainSources.emplace_back(pair.source->NameView());
+    detail_.mainBones.emplace_back(pair.target->NameView());
+    detail_.mainSources.emplace_back(pair.source->NameView());
 }
 
 void CDetailRecorder::AddErrors()
@@ -86,9 +86,9 @@ void CDetailRecorder::AddErrors()
             largest = i;
         errors.Add(error);
     }
-    m_kDetail.meanError.push_back(static_cast<float>(errors.Mean()));
-    m_kDetail.largestError.push_back(static_cast<float>(errors.Largest()));
-    m_kDetail.largestBone.push_back(static_cast<uint8_t>(largest));
+    detail_.meanError.push_back(static_cast<float>(errors.Mean()));
+    detail_.largestError.push_back(static_cast<float>(errors.Largest()));
+    detail_.largestBone.push_back(static_cast<uint8_t>(largest));
 }
 
 void CDetailRecorder::Add()
@@ -96,8 +96,8 @@ void CDetailRecorder::Add()
     AddErrors();
     if (!m_pkSourceRoot)
         return;
-    m_kDetail.sourceRoot.push_back(m_pkSourceRoot->m_kWorldMatrix.Translation());
-    m_kDetail.resultRoot.push_back(m_pkResultRoot->m_kWorldMatrix.Translation());
+    detail_.sourceRoot.push_back(m_pkSourceRoot->m_kWorldMatrix.Translation());
+    detail_.resultRoot.push_back(m_pkResultRoot->m_kWorldMatrix.Translation());
 }
 
 void CDetailRecorder::FinishParts()
@@ -106,10 +106,10 @@ void CDetailRecorder::FinishParts()
     for (size_t i = 0; i < bones.size(); ++i)
     {
         m_kMeters[i].Write(bones[i]);
-        bones[i].target = m_kDetail.mainBones[i];
+        bones[i].target = detail_.mainBones[i];
     }
     for (const BodyPart& part : BodyParts())
-        m_kDetail.parts.push_back(MeasurePart(part, bones));
+        detail_.parts.push_back(MeasurePart(part, bones));
 }
 
 void CDetailRecorder::Finish(const ConversionMeasures& measures)
@@ -117,12 +117,12 @@ void CDetailRecorder::Finish(const ConversionMeasures& measures)
     FinishParts();
     if (measures.sourceLeg > 0.0 && measures.resultLeg > 0.0)
     {
-        MoveToStart(m_kDetail.sourceRoot, m_kDetail.sourceFloor, measures.resultLeg / measures.sourceLeg);
-        MoveToStart(m_kDetail.resultRoot, 0.0, 1.0);
+        MoveToStart(detail_.sourceRoot, detail_.sourceFloor, measures.resultLeg / measures.sourceLeg);
+        MoveToStart(detail_.resultRoot, 0.0, 1.0);
         return;
     }
-    m_kDetail.sourceRoot.clear();
-    m_kDetail.resultRoot.clear();
+    detail_.sourceRoot.clear();
+    detail_.resultRoot.clear();
 }
 
 } // namespace gw

@@ -28,7 +28,7 @@ private:
     void AddErrors();
     void FinishParts();
 
-    ConversionDetail& m_kDetail;
+    ConversionDetail& detail_;
     std::vector<CBoneMeter> m_kMeters; // of the main bones
     const CNode* m_pkSourceRoot;       // null where the root is not mapped
     const CNode* m_pkResultRoot;

@@ -102,7 +102,7 @@ private:
     CFeetMeter m_kFeet;
     CTravelMeter m_kTravel;
     ConversionDetail* m_pkDetail; // null where nobody asks
-    std::optional<CDetailRecorder> m_kRecorder;
+    std::optional<CDetailRecorder> recorder_;
 };
 
 CComparison::CComparison(const MotionClip& source, const MotionClip& result, std::span<const BonePair> pairs,
@@ -120,7 +120,7 @@ CComparison::CComparison(const MotionClip& source, const MotionClip& result, std
         return;
     *detail = {};
     detail->secondsPerFrame = m_fSecondsPerFrame;
-    m_kRecorder.emplace(*detail, pairs, m_kSources, result.root);
+    recorder_.emplace(*detail, pairs, m_kSources, result.root);
 }
 
 void CComparison::PlanBones(std::span<const BonePair> pairs)
@@ -155,8 +155,8 @@ void CComparison::Run()
             meter.Add();
         m_kFeet.Add();
         m_kTravel.Add();
-        if (m_kRecorder)
-            m_kRecorder->Add();
+        if (recorder_)
+            recorder_->Add();
     }
 }
 
@@ -189,8 +189,8 @@ ConversionMeasures CComparison::Measures()
     WriteBones(measures);
     m_kFeet.Write(measures, m_fSecondsPerFrame, m_pkDetail);
     m_kTravel.Write(measures);
-    if (m_kRecorder)
-        m_kRecorder->Finish(measures);
+    if (recorder_)
+        recorder_->Finish(measures);
     return measures;
 }
 

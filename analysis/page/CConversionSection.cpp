@@ -62,7 +62,7 @@ void AddBothSides(Chart& chart, std::span<const float> source, std::span<const f
 } // namespace
 
 CConversionSection::CConversionSection(const ConvertedMotion& motion, size_t mostPoints)
-    : m_kMotion(motion), m_uiMostPoints(mostPoints),
+    : motion_(motion), m_uiMostPoints(mostPoints),
       m_kWorst(FindWorstFrames(motion.measured->sums, motion.measured->detail, kWorstFrames))
 {
     for (const WorstFrame& worst : m_kWorst)
@@ -78,30 +78,28 @@ void CConversionSection::Append(CMarkup& page, const std::string& anchor)
     page.Raw("<h3>Over time</h3>\n<div class=\"charts\">\n");
     AppendCurves(page);
     page.Raw("</div>\n<h3>Measurements</h3>\n<div class=\"tables\">\n<div>\n");
-    AppendPartTable(page, *m_kMotion.measured, m_kMotion.plain);
-    AppendFootTable(page, *m_kMotion.measured);
+    AppendPartTable(page, *motion_.measured, motion_.plain);
+    AppendFootTable(page, *motion_.measured);
     page.Raw("</div>\n");
-    AppendBoneTable(page, *m_kMotion.measured, m_kMotion.plain);
+    AppendBoneTable(page, *motion_.measured, motion_.plain);
     page.Raw("</div>\n</section>\n");
 }
 
 void CConversionSection::AppendHead(CMarkup& page) const
 {
-    const ConversionMeasures& sums = m_kMotion.measured->sums;
-    page.Raw("<h2><span class=\"source\">")
-        .FileName(m_kMotion.source)
-        .Raw("</span> → <span class=\"result\">");
-    page.FileName(m_kMotion.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(m_kMotion.profile);
+    const ConversionMeasures& sums = motion_.measured->sums;
+    page.Raw("<h2><span class=\"source\">").FileName(motion_.source).Raw("</span> → <span class=\"result\">");
+    page.FileName(motion_.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(motion_.profile);
     page.Raw(" · ").Integer(sums.frameCount).Raw(" frames compared · ");
-    page.Number(sums.frameCount * m_kMotion.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
+    page.Number(sums.frameCount * motion_.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
 }
 
 void CConversionSection::AppendTiles(CMarkup& page) const
 {
-    const std::vector<KeyFigure> figures = KeyFiguresOf(m_kMotion.measured->sums, m_kMotion.measured->detail);
+    const std::vector<KeyFigure> figures = KeyFiguresOf(motion_.measured->sums, motion_.measured->detail);
     std::vector<KeyFigure> plain;
-    if (m_kMotion.plain)
-        plain = KeyFiguresOf(m_kMotion.plain->sums, m_kMotion.plain->detail);
+    if (motion_.plain)
+        plain = KeyFiguresOf(motion_.plain->sums, motion_.plain->detail);
     page.Raw("<div class=\"tiles\">\n");
     for (size_t i = 0; i < figures.size(); ++i)
     {
@@ -124,9 +122,9 @@ void CConversionSection::AppendTiles(CMarkup& page) const
 
 void CConversionSection::AppendWorstFrames(CMarkup& page) const
 {
-    const ConversionMeasures& sums = m_kMotion.measured->sums;
-    CFigurePoser source(m_kMotion.sourceClip, NamesOf(sums.bones, &BoneMeasures::source));
-    CFigurePoser result(m_kMotion.resultClip, NamesOf(sums.bones, &BoneMeasures::target));
+    const ConversionMeasures& sums = motion_.measured->sums;
+    CFigurePoser source(motion_.sourceClip, NamesOf(sums.bones, &BoneMeasures::source));
+    CFigurePoser result(motion_.resultClip, NamesOf(sums.bones, &BoneMeasures::target));
     if (!m_kWorst.empty())
         page.Raw("<h3>Worst frames</h3>\n<div class=\"worst\">\n");
     for (size_t i = 0; i < m_kWorst.size(); ++i)
@@ -135,7 +133,7 @@ void CConversionSection::AppendWorstFrames(CMarkup& page) const
         FigurePair pair{source.Pose(worst.frame, worst.fault, worst.source),
                         result.Pose(worst.frame * sums.frameScale, worst.fault, worst.target),
                         result.Across(kRightBones.thigh, kLeftBones.thigh)};
-        PlaceFigure(pair.source, m_kMotion.measured->detail.sourceFloor, SourceScale(sums));
+        PlaceFigure(pair.source, motion_.measured->detail.sourceFloor, SourceScale(sums));
         PlaceFigure(pair.result, 0.0, 1.0);
         page.Raw("<article><p><b class=\"number\">").Integer(static_cast<long long>(i + 1));
         page.Raw("</b> <b>Frame ").Integer(worst.frame).Raw("</b> ");
@@ -150,19 +148,19 @@ void CConversionSection::AppendWorstFrames(CMarkup& page) const
 
 void CConversionSection::AppendCurves(CMarkup& page) const
 {
-    const ConversionDetail& detail = m_kMotion.measured->detail;
+    const ConversionDetail& detail = motion_.measured->detail;
     Chart chart = NewChart("Direction error", "°");
     chart.fromZero = true;
-    if (m_kMotion.plain)
-        chart.curves.push_back({"mean, default conversion", "other", m_kMotion.plain->detail.meanError});
+    if (motion_.plain)
+        chart.curves.push_back({"mean, default conversion", "other", motion_.plain->detail.meanError});
     chart.curves.push_back({"worst main bone", "most", detail.largestError});
     chart.curves.push_back({"mean of main bones", "result", detail.meanError});
     AppendChart(page, chart, m_uiMostPoints);
     AppendRootHeight(page);
     for (size_t i = 0; i < detail.feet.size(); ++i)
-        AppendKnee(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
+        AppendKnee(page, detail.feet[i], motion_.measured->sums.feet[i].target);
     for (size_t i = 0; i < detail.feet.size(); ++i)
-        AppendSole(page, detail.feet[i], m_kMotion.measured->sums.feet[i].target);
+        AppendSole(page, detail.feet[i], motion_.measured->sums.feet[i].target);
     AppendPaths(page, detail.sourceRoot, detail.resultRoot, m_uiMostPoints);
 }
 
@@ -195,7 +193,7 @@ void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const
 
 void CConversionSection::AppendRootHeight(CMarkup& page) const
 {
-    const ConversionDetail& detail = m_kMotion.measured->detail;
+    const ConversionDetail& detail = motion_.measured->detail;
     const std::vector<float> source = Heights(detail.sourceRoot);
     const std::vector<float> result = Heights(detail.resultRoot);
     Chart chart = NewChart("Height of the root", "mm above the floor");

@@ -32,7 +32,7 @@ private:
     void AppendSole(CMarkup& page, const FootDetail& foot, const std::string& name) const;
     void AppendRootHeight(CMarkup& page) const;
 
-    const ConvertedMotion& m_kMotion;
+    const ConvertedMotion& motion_;
     size_t m_uiMostPoints;
     std::vector<WorstFrame> m_kWorst;
     std::vector<ChartMark> m_kMarks; // where these are

@@ -49,7 +49,7 @@ CMarkup& CMarkup::Name(std::string_view name)
 
 CMarkup& CMarkup::FileName(std::string_view path)
 {
-    const CPathParts parts = SplitPath(path);
+    const PathParts parts = SplitPath(path);
     return Raw("<span title=\"").Name(path).Raw("\">").Name(parts.stem + parts.extension).Raw("</span>");
 }
 

@@ -56,30 +56,29 @@ class CChartDrawing
 {
 public:
     CChartDrawing(CMarkup& page, const Chart& chart, std::vector<ThinnedCurve> curves, size_t frameCount)
-        : m_kPage(page), m_kChart(chart), m_kCurves(std::move(curves)),
-          m_kHeight(HeightAxis(chart, m_kCurves)),
+        : page_(page), chart_(chart), m_kCurves(std::move(curves)), m_kHeight(HeightAxis(chart, m_kCurves)),
           m_fLastFrame(std::max(1.0, static_cast<double>(frameCount) - 1.0))
     {
     }
 
     void Draw()
     {
-        m_kPage.Raw("<figure class=\"chart\"><figcaption><b>").Name(m_kChart.title).Raw("</b> ");
-        m_kPage.Raw(m_kChart.unit);
+        page_.Raw("<figure class=\"chart\"><figcaption><b>").Name(chart_.title).Raw("</b> ");
+        page_.Raw(chart_.unit);
         DrawLegend();
-        m_kPage.Raw("</figcaption>\n<div class=\"plot\">");
-        m_kPage.Raw("<svg viewBox=\"0 0 1000 100\" preserveAspectRatio=\"none\" role=\"img\" aria-label=\"");
-        m_kPage.Name(m_kChart.title).Raw(" over the frames\">");
+        page_.Raw("</figcaption>\n<div class=\"plot\">");
+        page_.Raw("<svg viewBox=\"0 0 1000 100\" preserveAspectRatio=\"none\" role=\"img\" aria-label=\"");
+        page_.Name(chart_.title).Raw(" over the frames\">");
         DrawGrid();
         DrawStrips();
         DrawMarks();
         for (const ThinnedCurve& curve : m_kCurves)
             DrawCurve(curve);
-        m_kPage.Raw("</svg>");
+        page_.Raw("</svg>");
         LabelHeights();
         LabelFrames();
         LabelMarks();
-        m_kPage.Raw("</div></figure>\n");
+        page_.Raw("</div></figure>\n");
     }
 
 private:
@@ -88,62 +87,62 @@ private:
 
     void DrawLegend()
     {
-        m_kPage.Raw("<span class=\"legend\">");
-        for (const ChartCurve& curve : m_kChart.curves)
-            m_kPage.Raw(" <i class=\"key ").Raw(curve.style).Raw("\"></i>").Raw(curve.name);
-        for (const ChartStrip& strip : m_kChart.strips)
-            m_kPage.Raw(" <i class=\"key strip ").Raw(strip.style).Raw("\"></i>").Raw(strip.name);
-        m_kPage.Raw("</span>");
+        page_.Raw("<span class=\"legend\">");
+        for (const ChartCurve& curve : chart_.curves)
+            page_.Raw(" <i class=\"key ").Raw(curve.style).Raw("\"></i>").Raw(curve.name);
+        for (const ChartStrip& strip : chart_.strips)
+            page_.Raw(" <i class=\"key strip ").Raw(strip.style).Raw("\"></i>").Raw(strip.name);
+        page_.Raw("</span>");
     }
     void DrawGrid()
     {
-        m_kPage.Raw("<path class=\"grid\" d=\"");
+        page_.Raw("<path class=\"grid\" d=\"");
         for (const double tick : m_kHeight.Ticks())
-            m_kPage.Raw("M0 ").Number(Y(tick), 2).Raw("H1000");
-        m_kPage.Raw("\"/>");
+            page_.Raw("M0 ").Number(Y(tick), 2).Raw("H1000");
+        page_.Raw("\"/>");
     }
     // The strips lie one over the other at the bottom, the first one highest.
     void DrawStrips()
     {
-        double top = kHeight - kStripHeight * static_cast<double>(m_kChart.strips.size());
-        for (const ChartStrip& strip : m_kChart.strips)
+        double top = kHeight - kStripHeight * static_cast<double>(chart_.strips.size());
+        for (const ChartStrip& strip : chart_.strips)
         {
-            m_kPage.Raw("<path class=\"strip ").Raw(strip.style).Raw("\" d=\"");
+            page_.Raw("<path class=\"strip ").Raw(strip.style).Raw("\" d=\"");
             for (const Contact& stretch : strip.stretches)
             {
-                m_kPage.Raw("M").Number(X(stretch.first), 1).Raw(" ").Number(top, 1);
-                m_kPage.Raw("H").Number(X(stretch.end - 1), 1).Raw("v").Number(kStripHeight - 1.0, 1);
-                m_kPage.Raw("H").Number(X(stretch.first), 1).Raw("z");
+                page_.Raw("M").Number(X(stretch.first), 1).Raw(" ").Number(top, 1);
+                page_.Raw("H").Number(X(stretch.end - 1), 1).Raw("v").Number(kStripHeight - 1.0, 1);
+                page_.Raw("H").Number(X(stretch.first), 1).Raw("z");
             }
-            m_kPage.Raw("\"/>");
+            page_.Raw("\"/>");
             top += kStripHeight;
         }
     }
     void DrawMarks()
     {
-        for (const ChartMark& mark : m_kChart.marks)
-            m_kPage.Raw("<path class=\"mark\" d=\"M").Number(X(mark.frame), 1).Raw(" 0V100\"/>");
+        for (const ChartMark& mark : chart_.marks)
+            page_.Raw("<path class=\"mark\" d=\"M").Number(X(mark.frame), 1).Raw(" 0V100\"/>");
     }
     void DrawCurve(const ThinnedCurve& curve)
     {
-        m_kPage.Raw("<path class=\"curve ").Raw(curve.curve.style).Raw("\" d=\"");
+        page_.Raw("<path class=\"curve ").Raw(curve.curve.style).Raw("\" d=\"");
         const char* command = "M";
         for (const CurvePoint& point : curve.points)
         {
-            m_kPage.Raw(command).Number(X(point.frame), 1).Raw(" ");
-            m_kPage.Number(Y(static_cast<double>(point.value)), 1);
+            page_.Raw(command).Number(X(point.frame), 1).Raw(" ");
+            page_.Number(Y(static_cast<double>(point.value)), 1);
             command = "L";
         }
         if (curve.points.size() == 1)
-            m_kPage.Raw("h1000"); // a pose without motion
-        m_kPage.Raw("\"/>");
+            page_.Raw("h1000"); // a pose without motion
+        page_.Raw("\"/>");
     }
     void LabelHeights()
     {
         for (const double tick : m_kHeight.Ticks())
         {
-            m_kPage.Raw("<span class=\"y\" style=\"top:").Number(Y(tick), 1).Raw("%\">");
-            m_kPage.Number(tick, m_kHeight.Decimals()).Raw("</span>");
+            page_.Raw("<span class=\"y\" style=\"top:").Number(Y(tick), 1).Raw("%\">");
+            page_.Number(tick, m_kHeight.Decimals()).Raw("</span>");
         }
     }
     // The axis goes on to a round number; the motion need not.
@@ -153,21 +152,21 @@ private:
         {
             if (tick > m_fLastFrame || tick != std::floor(tick))
                 continue;
-            m_kPage.Raw("<span class=\"x\" style=\"left:").Number(X(tick) / kWidth * 100.0, 1).Raw("%\">");
-            m_kPage.Number(tick, 0).Raw("</span>");
+            page_.Raw("<span class=\"x\" style=\"left:").Number(X(tick) / kWidth * 100.0, 1).Raw("%\">");
+            page_.Number(tick, 0).Raw("</span>");
         }
     }
     void LabelMarks()
     {
-        for (const ChartMark& mark : m_kChart.marks)
+        for (const ChartMark& mark : chart_.marks)
         {
-            m_kPage.Raw("<span class=\"number\" style=\"left:").Number(X(mark.frame) / kWidth * 100.0, 1);
-            m_kPage.Raw("%\">").Integer(static_cast<long long>(mark.number)).Raw("</span>");
+            page_.Raw("<span class=\"number\" style=\"left:").Number(X(mark.frame) / kWidth * 100.0, 1);
+            page_.Raw("%\">").Integer(static_cast<long long>(mark.number)).Raw("</span>");
         }
     }
 
-    CMarkup& m_kPage;
-    const Chart& m_kChart;
+    CMarkup& page_;
+    const Chart& chart_;
     std::vector<ThinnedCurve> m_kCurves;
     CAxis m_kHeight;
     double m_fLastFrame;

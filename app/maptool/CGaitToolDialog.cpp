@@ -22,8 +22,8 @@ constexpr const char* kBaseFile = "base.htr";
 constexpr float kSavedScale = 0.016667f;
 constexpr const char* kSavedNote = ", every sixtieth frame";
 
-const CFileDialogSetup kOpenMotion{"htr", "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||", {}};
-const CFileDialogSetup kSaveMotion{"htr", "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||", {}};
+const FileDialogSetup kOpenMotion{"htr", "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||", {}};
+const FileDialogSetup kSaveMotion{"htr", "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||", {}};
 
 constexpr void (CMotionView::*kTransport[])() = {
     &CMotionView::SeekStart, &CMotionView::StepBack,    &CMotionView::Stop,
@@ -68,7 +68,7 @@ const CGaitToolDialog::Command* CGaitToolDialog::FindCommand(int id)
 }
 
 CGaitToolDialog::CGaitToolDialog(CToolWindow& window, const CPlatform& platform)
-    : m_kWindow(window), m_kPlatform(platform), m_kSourceTree(CProfileEditorDialog::kMappedSourceImage),
+    : window_(window), platform_(platform), m_kSourceTree(CProfileEditorDialog::kMappedSourceImage),
       m_kTargetTree(CProfileEditorDialog::kMappedTargetImage)
 {
 }
@@ -78,7 +78,7 @@ CGaitToolDialog::~CGaitToolDialog() = default;
 void CGaitToolDialog::OnInitDialog()
 {
     for (const EToolMotion motion : kToolMotions)
-        m_kViews[Index(motion)] = m_kWindow.CreateView(motion);
+        m_kViews[Index(motion)] = window_.CreateView(motion);
 }
 
 // ---- buttons
@@ -140,13 +140,13 @@ int CGaitToolDialog::LastFrameOf(EToolMotion motion) const
 
 void CGaitToolDialog::AskSource()
 {
-    if (const auto path = m_kWindow.AskOpenFile(kOpenMotion))
+    if (const auto path = window_.AskOpenFile(kOpenMotion))
         LoadSource(*path);
 }
 
 void CGaitToolDialog::AskTarget()
 {
-    if (const auto path = m_kWindow.AskOpenFile(kOpenMotion))
+    if (const auto path = window_.AskOpenFile(kOpenMotion))
         LoadTarget(*path);
 }
 
@@ -171,12 +171,12 @@ bool CGaitToolDialog::DropFile(EToolMotion motion, const std::string& path)
 
 bool CGaitToolDialog::LoadSource(const std::string& path)
 {
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     if (!Load(EToolMotion::Source, path))
         return false;
     // A target is there from now on. Where it cannot be read, that is what the user must know first.
     const std::string loaded = m_kStatus;
-    if (LoadTargetMotions(m_kPlatform.DataFolder() + kBaseFile))
+    if (LoadTargetMotions(platform_.DataFolder() + kBaseFile))
         m_kStatus = loaded;
     TakeSkeletons();
     return true;
@@ -184,7 +184,7 @@ bool CGaitToolDialog::LoadSource(const std::string& path)
 
 bool CGaitToolDialog::LoadTarget(const std::string& path)
 {
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     if (!LoadTargetMotions(path))
         return false;
     TakeSkeletons();
@@ -231,13 +231,13 @@ void CGaitToolDialog::TakeSkeletons()
 {
     Rebuild(m_kSourceTree, Root(EToolMotion::Source));
     Rebuild(m_kTargetTree, Root(EToolMotion::Target));
-    m_kStatus += PrunedWords(m_kMap.Prune([this](const CMapLine& line) { return IsMappable(line); }));
+    m_kStatus += PrunedWords(m_kMap.Prune([this](const MapLine& line) { return IsMappable(line); }));
     MarkBones();
 }
 
 void CGaitToolDialog::Convert()
 {
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     for (const EToolMotion motion : kToolMotions)
     {
         if (View(motion))
@@ -250,7 +250,7 @@ void CGaitToolDialog::Convert()
     retargeter.SetScenes(Root(EToolMotion::Source), Root(EToolMotion::Result));
     const CBoneNames sources(Root(EToolMotion::Source));
     const CBoneNames targets(Root(EToolMotion::Result));
-    for (const CMapLine& line : m_kMap.Lines())
+    for (const MapLine& line : m_kMap.Lines())
         ApplyLine(retargeter, line, sources, targets);
     const SourceTiming timing = TimingOf(Motion(EToolMotion::Source));
     retargeter.Retarget(0.0f, timing.lastFrame, 0.0f, timing.frequency, m_kMap.RootPosition(), false, false);
@@ -260,7 +260,7 @@ void CGaitToolDialog::Convert()
 }
 
 // A bone that is not there is null, as a key or as a source, which the retargeter takes for none.
-void CGaitToolDialog::ApplyLine(CRetargeter& retargeter, const CMapLine& line, const CBoneNames& sources,
+void CGaitToolDialog::ApplyLine(CRetargeter& retargeter, const MapLine& line, const CBoneNames& sources,
                                 const CBoneNames& targets)
 {
     m_kMap.TakeValue(line);
@@ -276,13 +276,13 @@ void CGaitToolDialog::ApplyLine(CRetargeter& retargeter, const CMapLine& line, c
 
 void CGaitToolDialog::AskResultPath()
 {
-    if (const auto path = m_kWindow.AskSaveFile(kSaveMotion))
+    if (const auto path = window_.AskSaveFile(kSaveMotion))
         SaveResult(*path);
 }
 
 bool CGaitToolDialog::SaveResult(const std::string& path)
 {
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     CMotionFile& result = m_kMotions[Index(EToolMotion::Result)];
     const bool saved = result.Save(path, kSavedScale);
     m_kStatus = saved ? SavedWords(path) + kSavedNote : NotSavedWords(path, result.Record().Failure());

@@ -111,7 +111,7 @@ private:
     void AskMapPath();
     void AskResultPath();
     void EditDetail();
-    void Close() { m_kWindow.CloseWindow(); }
+    void Close() { window_.CloseWindow(); }
 
     // When they take a click.
     bool Always() const { return true; }
@@ -129,12 +129,12 @@ private:
     void ShowMotion(EToolMotion motion);
     void TakeSkeletons();
     void MarkBones();
-    bool IsMappable(const CMapLine& line) const;
-    void ApplyLine(CRetargeter& retargeter, const CMapLine& line, const CBoneNames& sources,
+    bool IsMappable(const MapLine& line) const;
+    void ApplyLine(CRetargeter& retargeter, const MapLine& line, const CBoneNames& sources,
                    const CBoneNames& targets);
 
-    CToolWindow& m_kWindow;
-    const CPlatform& m_kPlatform;
+    CToolWindow& window_;
+    const CPlatform& platform_;
     std::array<CMotionFile, 3> m_kMotions;
     std::string m_kTargetPath; ///< of the file that target and result were read from
     std::array<std::unique_ptr<CMotionView>, 3> m_kViews;

@@ -16,18 +16,18 @@ constexpr std::string_view kFrameRate = "framerate";
 constexpr std::string_view kHeadText = "Unknown Source";
 constexpr size_t kTextLimit = 32;
 
-bool SpeaksOfPosition(const CMapLine& line)
+bool SpeaksOfPosition(const MapLine& line)
 {
     return LowerCase(line.text).find(kPosition) != std::string::npos;
 }
 
 // A keyword further inside, as in "Composition", makes a line of its kind all the same but sets nothing.
-bool BeginsWith(const CMapLine& line, std::string_view keyword)
+bool BeginsWith(const MapLine& line, std::string_view keyword)
 {
     return EqualNoCase(std::string_view(line.text).substr(0, keyword.size()), keyword);
 }
 
-std::string RewrittenText(const CMapLine& line)
+std::string RewrittenText(const MapLine& line)
 {
     switch (line.kind)
     {
@@ -46,7 +46,7 @@ std::string RewrittenText(const CMapLine& line)
 
 } // namespace
 
-const CMapLine* CMapLineList::SelectedLine() const
+const MapLine* CMapLineList::SelectedLine() const
 {
     return m_iSelected == kNone ? nullptr : &m_kLines[static_cast<size_t>(m_iSelected)];
 }
@@ -56,7 +56,7 @@ void CMapLineList::Select(int index)
     m_iSelected = index >= 0 && static_cast<size_t>(index) < m_kLines.size() ? index : kNone;
 }
 
-void CMapLineList::Append(const CMapLine& line)
+void CMapLineList::Append(const MapLine& line)
 {
     TakeValue(line);
     m_kLines.push_back(line);
@@ -66,9 +66,9 @@ void CMapLineList::EnsureHead()
 {
     if (std::ranges::any_of(m_kLines, SpeaksOfPosition))
         return;
-    const CMapLine head[] = {ParseMapLine(kHeadText), ParseMapLine(PositionLine(kVec3Zero)),
-                             ParseMapLine(FrameRateLine(kDefaultFrameRate))};
-    std::ranges::for_each(head, [this](const CMapLine& line) { TakeValue(line); });
+    const MapLine head[] = {ParseMapLine(kHeadText), ParseMapLine(PositionLine(kVec3Zero)),
+                            ParseMapLine(FrameRateLine(kDefaultFrameRate))};
+    std::ranges::for_each(head, [this](const MapLine& line) { TakeValue(line); });
     m_kLines.insert(m_kLines.begin(), std::begin(head), std::end(head));
     if (m_iSelected != kNone)
         m_iSelected += static_cast<int>(std::size(head));
@@ -80,11 +80,11 @@ void CMapLineList::Add(std::string_view source, std::string_view target)
     Append(ParseMapLine(MappingLine(source, target)));
 }
 
-size_t CMapLineList::Replace(const std::vector<CMapLine>& lines, const Fits& fits)
+size_t CMapLineList::Replace(const std::vector<MapLine>& lines, const Fits& fits)
 {
     Clear();
     size_t leftOut = 0;
-    for (const CMapLine& line : lines)
+    for (const MapLine& line : lines)
     {
         if (line.kind == EMapLine::Mapping && !fits(line))
         {
@@ -100,11 +100,11 @@ size_t CMapLineList::Replace(const std::vector<CMapLine>& lines, const Fits& fit
 
 size_t CMapLineList::Prune(const Fits& fits)
 {
-    const std::vector<CMapLine> before = std::exchange(m_kLines, {});
+    const std::vector<MapLine> before = std::exchange(m_kLines, {});
     const int selected = std::exchange(m_iSelected, kNone);
     for (size_t index = 0; index < before.size(); ++index)
     {
-        const CMapLine& line = before[index];
+        const MapLine& line = before[index];
         if (line.kind != EMapLine::Mapping || !fits(line))
             continue;
         if (static_cast<int>(index) == selected)
@@ -129,7 +129,7 @@ void CMapLineList::Clear()
     m_iSelected = kNone;
 }
 
-void CMapLineList::ReplaceSelected(const CMapLine& line)
+void CMapLineList::ReplaceSelected(const MapLine& line)
 {
     if (m_iSelected == kNone)
         return;
@@ -137,7 +137,7 @@ void CMapLineList::ReplaceSelected(const CMapLine& line)
     m_kLines[static_cast<size_t>(m_iSelected)] = line;
 }
 
-void CMapLineList::TakeValue(const CMapLine& line)
+void CMapLineList::TakeValue(const MapLine& line)
 {
     if (line.kind == EMapLine::Position && BeginsWith(line, kPosition))
         m_kRootPosition = line.numbers;
@@ -145,7 +145,7 @@ void CMapLineList::TakeValue(const CMapLine& line)
         m_iFrameRate = line.frameRate;
 }
 
-CMapLine RewrittenLine(const CMapLine& line)
+MapLine RewrittenLine(const MapLine& line)
 {
     return ParseMapLine(RewrittenText(line));
 }

@@ -8,8 +8,8 @@ namespace gw {
 
 namespace {
 
-const CFileDialogSetup kOpenMap{{}, "Map Files |*.prf;|Nap Files |*.txt;||", {}};
-const CFileDialogSetup kSaveMap{"txt", "Map Files |*.txt;||", {}};
+const FileDialogSetup kOpenMap{{}, "Map Files |*.prf;|Nap Files |*.txt;||", {}};
+const FileDialogSetup kSaveMap{"txt", "Map Files |*.txt;||", {}};
 
 void UnmarkAll(CBoneTree& tree)
 {
@@ -19,7 +19,7 @@ void UnmarkAll(CBoneTree& tree)
 
 } // namespace
 
-bool CGaitToolDialog::IsMappable(const CMapLine& line) const
+bool CGaitToolDialog::IsMappable(const MapLine& line) const
 {
     return m_kSourceTree.Find(line.source) != CBoneTree::kNone &&
            m_kTargetTree.Find(line.target) != CBoneTree::kNone;
@@ -30,7 +30,7 @@ void CGaitToolDialog::MarkBones()
 {
     UnmarkAll(m_kSourceTree);
     UnmarkAll(m_kTargetTree);
-    for (const CMapLine& line : m_kMap.Lines())
+    for (const MapLine& line : m_kMap.Lines())
     {
         if (line.kind != EMapLine::Mapping)
             continue;
@@ -42,7 +42,7 @@ void CGaitToolDialog::MarkBones()
 void CGaitToolDialog::SelectLine(int index)
 {
     m_kMap.Select(index);
-    const CMapLine* const line = m_kMap.SelectedLine();
+    const MapLine* const line = m_kMap.SelectedLine();
     if (!line || line->kind != EMapLine::Mapping)
         return;
     m_kSourceTree.Select(m_kSourceTree.Find(line->source));
@@ -76,8 +76,8 @@ void CGaitToolDialog::RemoveAllLines()
 
 void CGaitToolDialog::EditDetail()
 {
-    CMapLine line = *m_kMap.SelectedLine();
-    if (!m_kWindow.EditLine(line))
+    MapLine line = *m_kMap.SelectedLine();
+    if (!window_.EditLine(line))
         return;
     m_kMap.ReplaceSelected(RewrittenLine(line));
     MarkBones();
@@ -85,19 +85,19 @@ void CGaitToolDialog::EditDetail()
 
 void CGaitToolDialog::AskMap()
 {
-    if (const auto path = m_kWindow.AskOpenFile(kOpenMap))
+    if (const auto path = window_.AskOpenFile(kOpenMap))
         LoadMap(*path);
 }
 
 bool CGaitToolDialog::LoadMap(const std::string& path)
 {
-    std::vector<CMapLine> lines;
+    std::vector<MapLine> lines;
     if (!ReadMapLines(path, lines))
     {
         m_kStatus = NoMapWords(path);
         return false;
     }
-    const size_t leftOut = m_kMap.Replace(lines, [this](const CMapLine& line) { return IsMappable(line); });
+    const size_t leftOut = m_kMap.Replace(lines, [this](const MapLine& line) { return IsMappable(line); });
     MarkBones();
     m_kStatus = MapWords(path, m_kMap.Lines().size(), leftOut);
     return true;
@@ -105,7 +105,7 @@ bool CGaitToolDialog::LoadMap(const std::string& path)
 
 void CGaitToolDialog::AskMapPath()
 {
-    if (const auto path = m_kWindow.AskSaveFile(kSaveMap))
+    if (const auto path = window_.AskSaveFile(kSaveMap))
         SaveMap(*path);
 }
 

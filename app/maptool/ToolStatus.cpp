@@ -15,7 +15,7 @@ namespace {
 
 std::string FileName(const std::string& path)
 {
-    const CPathParts parts = SplitPath(path);
+    const PathParts parts = SplitPath(path);
     return parts.stem + parts.extension;
 }
 

@@ -17,12 +17,12 @@ std::string_view NextPart(std::string_view& rest)
 
 } // namespace
 
-std::vector<CFileFilter> SplitFilter(std::string_view filter)
+std::vector<FileFilter> SplitFilter(std::string_view filter)
 {
-    std::vector<CFileFilter> choices;
+    std::vector<FileFilter> choices;
     while (!filter.empty())
     {
-        CFileFilter choice;
+        FileFilter choice;
         choice.text = NextPart(filter);
         std::string_view patterns = NextPart(filter);
         for (std::string_view pattern = NextToken(patterns, ";"); !pattern.empty();

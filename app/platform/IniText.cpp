@@ -86,8 +86,8 @@ std::string SectionOf(std::string_view line)
 // Where a key stands, and where a new one goes.
 struct Place
 {
-    std::optional<Line> m_kEntry;
-    std::optional<size_t> m_kSectionEnd; // behind the last line of the section
+    std::optional<Line> entry;
+    std::optional<size_t> sectionEnd; // behind the last line of the section
 };
 
 Place FindPlace(std::string_view text, std::string_view section, std::string_view key)
@@ -102,11 +102,11 @@ Place FindPlace(std::string_view text, std::string_view section, std::string_vie
             current = SectionOf(content);
         if (current != wanted)
             continue;
-        place.m_kSectionEnd = line.m_uiEnd;
+        place.sectionEnd = line.m_uiEnd;
         const bool isEntry = !content.starts_with('[') && line.m_uiEquals != text.npos;
         if (isEntry &&
             UnescapedIniKey(Trimmed(text.substr(line.m_uiBegin, line.m_uiEquals - line.m_uiBegin))) == key)
-            place.m_kEntry = line;
+            place.entry = line;
     }
     return place;
 }
@@ -116,7 +116,7 @@ Place FindPlace(std::string_view text, std::string_view section, std::string_vie
 std::optional<std::string> FindIniValue(std::string_view text, std::string_view section, std::string_view key)
 {
     text = SkipByteOrderMark(text);
-    const auto entry = FindPlace(text, section, key).m_kEntry;
+    const auto entry = FindPlace(text, section, key).entry;
     if (!entry)
         return std::nullopt;
     const size_t begin = entry->m_uiEquals + 1;
@@ -130,11 +130,10 @@ std::string SetIniValue(std::string_view text, std::string_view section, std::st
     CloseLastLine(result);
     const Place place = FindPlace(result, section, key);
     const std::string entry = EscapedIniKey(key) + '=' + EscapedIniValue(value);
-    if (place.m_kEntry)
-        return result.replace(place.m_kEntry->m_uiBegin, place.m_kEntry->m_uiEnd - place.m_kEntry->m_uiBegin,
-                              entry);
-    if (place.m_kSectionEnd)
-        return result.insert(EndOfPhysicalLine(result, *place.m_kSectionEnd), '\n' + entry);
+    if (place.entry)
+        return result.replace(place.entry->m_uiBegin, place.entry->m_uiEnd - place.entry->m_uiBegin, entry);
+    if (place.sectionEnd)
+        return result.insert(EndOfPhysicalLine(result, *place.sectionEnd), '\n' + entry);
     if (!result.empty())
         result += result.ends_with('\n') ? "\n" : "\n\n";
     return result + '[' + EscapedIniKey(section) + "]\n" + entry + '\n';

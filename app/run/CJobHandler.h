@@ -8,7 +8,7 @@
 namespace gw {
 
 /// How a job ended, and what it said.
-struct CJobEnd
+struct JobEnd
 {
     enum class EKind : uint8_t
     {
@@ -40,7 +40,7 @@ public:
     /// A job's process is gone; nobody works on it any longer. Comes at once.
     virtual void Lost(size_t) {}
     /// A job ended. Comes in the order of the jobs, whichever ended first. False ends the run.
-    virtual bool Take(size_t job, const CJobEnd& end) = 0;
+    virtual bool Take(size_t job, const JobEnd& end) = 0;
     /// Comes several times a second while jobs run, with the number of those that have ended.
     virtual void Tick(size_t) {}
 };

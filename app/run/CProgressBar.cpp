@@ -61,7 +61,7 @@ void Write(const std::string& text)
 
 } // namespace
 
-std::string ProgressLine(const CProgress& progress, size_t width)
+std::string ProgressLine(const RunProgress& progress, size_t width)
 {
     const size_t left = progress.total - std::min(progress.done, progress.total);
     std::string line = Bar(progress.done, progress.total) + ' ' + std::to_string(progress.done) + '/' +
@@ -87,7 +87,7 @@ void CProgressBar::Show(size_t done, size_t failed)
     m_kDue = now + kPeriod;
     m_bOnScreen = true;
     // One column stays free: a full line would break.
-    const CProgress progress{done, m_uiTotal, failed, Rate({now, done})};
+    const RunProgress progress{done, m_uiTotal, failed, Rate({now, done})};
     Write("\r\x1b[K" + ProgressLine(progress, TerminalWidth() - 1));
 }
 

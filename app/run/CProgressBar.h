@@ -8,7 +8,7 @@
 namespace gw {
 
 /// How far a run is.
-struct CProgress
+struct RunProgress
 {
     size_t done = 0;
     size_t total = 0;
@@ -17,7 +17,7 @@ struct CProgress
 };
 
 /// "[=====>    ] 512/1000  48.2/s  10s left, 3 failed", cut to a width in characters.
-std::string ProgressLine(const CProgress& progress, size_t width);
+std::string ProgressLine(const RunProgress& progress, size_t width);
 
 /// A line on the terminal of standard error that shows how far a run is. Where standard error is none,
 /// nothing is shown.

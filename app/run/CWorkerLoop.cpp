@@ -11,7 +11,7 @@ namespace gw {
 namespace {
 
 // False when the program is gone or wants no more.
-bool Receive(int socket, CWorkerOrder& order)
+bool Receive(int socket, WorkerOrder& order)
 {
     ssize_t count = 0;
     do
@@ -20,7 +20,7 @@ bool Receive(int socket, CWorkerOrder& order)
     return count == sizeof order;
 }
 
-bool Reply(int socket, const CWorkerReply& reply)
+bool Reply(int socket, const WorkerReply& reply)
 {
     return send(socket, &reply, sizeof reply, MSG_NOSIGNAL) == sizeof reply;
 }
@@ -28,20 +28,20 @@ bool Reply(int socket, const CWorkerReply& reply)
 } // namespace
 
 CWorkerLoop::CWorkerLoop(CJobHandler& handler, int socket, std::FILE* record, ECommit commit)
-    : m_kHandler(handler), m_iSocket(socket), m_pkRecord(record), m_eCommit(commit)
+    : handler_(handler), m_iSocket(socket), m_pkRecord(record), m_eCommit(commit)
 {
     CSafeFile::SetCommitGate([this](const std::string& privatePath) { return MayCommit(privatePath); });
 }
 
 void CWorkerLoop::Run()
 {
-    for (CWorkerOrder order; Receive(m_iSocket, order);)
+    for (WorkerOrder order; Receive(m_iSocket, order);)
     {
         const Clock::time_point start = Clock::now();
         m_kWaited = {};
         m_bMayCommit = m_eCommit == ECommit::AtOnce;
         m_uiJob = order.job;
-        const uint8_t answer = m_kHandler.Run(order.job, m_pkRecord);
+        const uint8_t answer = handler_.Run(order.job, m_pkRecord);
         const std::chrono::duration<double> worked = Clock::now() - start - m_kWaited;
         std::fflush(nullptr);
         if (!Reply(m_iSocket, {.answer = answer, .seconds = worked.count()}))
@@ -53,14 +53,14 @@ bool CWorkerLoop::MayCommit(const std::string& privatePath)
 {
     if (!m_bMayCommit && !AskToCommit())
         return false;
-    m_kHandler.Ready(m_uiJob, privatePath);
+    handler_.Ready(m_uiJob, privatePath);
     return true;
 }
 
 bool CWorkerLoop::AskToCommit()
 {
     const Clock::time_point start = Clock::now();
-    CWorkerOrder order;
+    WorkerOrder order;
     m_bMayCommit = Reply(m_iSocket, {.asks = true}) && Receive(m_iSocket, order);
     m_kWaited += Clock::now() - start;
     return m_bMayCommit;

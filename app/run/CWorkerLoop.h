@@ -26,7 +26,7 @@ private:
     bool MayCommit(const std::string& privatePath);
     bool AskToCommit();
 
-    CJobHandler& m_kHandler;
+    CJobHandler& handler_;
     int m_iSocket;
     std::FILE* m_pkRecord;
     ECommit m_eCommit;

@@ -26,8 +26,8 @@ constexpr std::chrono::seconds kGrace(10); // for what is under way when the run
 
 } // namespace
 
-CWorkerPool::CWorkerPool(CJobHandler& handler, const CPoolSettings& settings)
-    : m_kHandler(handler), m_kSettings(settings)
+CWorkerPool::CWorkerPool(CJobHandler& handler, const PoolSettings& settings)
+    : handler_(handler), m_kSettings(settings)
 {
 }
 
@@ -37,24 +37,24 @@ bool CWorkerPool::Run(size_t jobCount, const CInterrupt& interrupt)
 {
     for (;;)
     {
-        if (!m_kEnding && (m_bRefused || interrupt.Count() > 0))
-            m_kEnding = Clock::now();
-        if (!m_kEnding)
+        if (!ending_ && (m_bRefused || interrupt.Count() > 0))
+            ending_ = Clock::now();
+        if (!ending_)
             GiveJobs(jobCount);
         OpenGate();
         if (CountIn(EState::Running) == 0)
             break;
         Wait();
         ReceiveAll();
-        if (m_kEnding && (interrupt.Count() > 1 || Clock::now() - *m_kEnding > kGrace))
+        if (ending_ && (interrupt.Count() > 1 || Clock::now() - *ending_ > kGrace))
             AbandonRunning();
         KillLate();
         TakeEnds();
-        m_kHandler.Tick(m_uiTaken + m_kEnded.size());
+        handler_.Tick(m_uiTaken + m_kEnded.size());
     }
     Dismiss();
     TakeRest();
-    return m_kEnding || m_uiTaken == jobCount;
+    return ending_ || m_uiTaken == jobCount;
 }
 
 size_t CWorkerPool::CountIn(EState state) const
@@ -78,7 +78,7 @@ CWorkerProcess* CWorkerPool::StartWorker()
     std::vector<int> sockets;
     for (const auto& worker : m_kWorkers)
         sockets.push_back(worker->Socket());
-    std::unique_ptr<CWorkerProcess> worker = CWorkerProcess::Start(m_kHandler, m_kSettings.commit, sockets);
+    std::unique_ptr<CWorkerProcess> worker = CWorkerProcess::Start(handler_, m_kSettings.commit, sockets);
     return worker ? m_kWorkers.emplace_back(std::move(worker)).get() : nullptr;
 }
 
@@ -117,7 +117,7 @@ void CWorkerPool::ReceiveAll()
 {
     for (const auto& worker : m_kWorkers)
     {
-        CJobEnd end;
+        JobEnd end;
         if (worker->Receive(end))
             KeepEnd(*worker, std::move(end));
     }
@@ -130,7 +130,7 @@ void CWorkerPool::KillLate()
     {
         if (worker->State() != EState::Running || worker->RunningSeconds() < m_kSettings.jobSeconds)
             continue;
-        CJobEnd end;
+        JobEnd end;
         worker->Kill(end);
         KeepEnd(*worker, std::move(end));
     }
@@ -144,17 +144,17 @@ void CWorkerPool::AbandonRunning()
     {
         if (worker->State() != EState::Running)
             continue;
-        CJobEnd end;
+        JobEnd end;
         worker->Kill(end);
-        m_kHandler.Lost(worker->Job());
+        handler_.Lost(worker->Job());
     }
     ForgetGone();
 }
 
-void CWorkerPool::KeepEnd(CWorkerProcess& worker, CJobEnd&& end)
+void CWorkerPool::KeepEnd(CWorkerProcess& worker, JobEnd&& end)
 {
     if (worker.State() == EState::Gone)
-        m_kHandler.Lost(worker.Job());
+        handler_.Lost(worker.Job());
     m_kEnded.emplace(worker.Job(), std::move(end));
 }
 
@@ -168,7 +168,7 @@ void CWorkerPool::TakeEnds()
     while (!m_bRefused && !m_kEnded.empty() && m_kEnded.begin()->first == m_uiTaken)
     {
         const auto first = m_kEnded.extract(m_kEnded.begin());
-        m_bRefused = !m_kHandler.Take(m_uiTaken++, first.mapped());
+        m_bRefused = !handler_.Take(m_uiTaken++, first.mapped());
     }
 }
 
@@ -176,7 +176,7 @@ void CWorkerPool::TakeEnds()
 void CWorkerPool::TakeRest()
 {
     for (auto end = m_kEnded.begin(); !m_bRefused && end != m_kEnded.end(); ++end)
-        m_bRefused = !m_kHandler.Take(end->first, end->second);
+        m_bRefused = !handler_.Take(end->first, end->second);
 }
 
 // All are told before any is waited for.

@@ -11,7 +11,7 @@ namespace gw {
 
 class CInterrupt;
 
-struct CPoolSettings
+struct PoolSettings
 {
     size_t workerCount = 1;    ///< processes that work at a time
     double jobSeconds = 600.0; ///< a job that takes longer is given up
@@ -24,7 +24,7 @@ class CWorkerPool
 {
 public:
     /// The handler must outlive the pool.
-    CWorkerPool(CJobHandler& handler, const CPoolSettings& settings);
+    CWorkerPool(CJobHandler& handler, const PoolSettings& settings);
     ~CWorkerPool();
 
     /// Does the jobs below a number. Ends when all have ended, when the handler refuses one, or when an end
@@ -46,19 +46,19 @@ private:
     void KillLate();
     void AbandonRunning();
     void ForgetGone();
-    void KeepEnd(CWorkerProcess& worker, CJobEnd&& end);
+    void KeepEnd(CWorkerProcess& worker, JobEnd&& end);
     void TakeEnds();
     void TakeRest();
     void Dismiss();
 
-    CJobHandler& m_kHandler;
-    CPoolSettings m_kSettings;
+    CJobHandler& handler_;
+    PoolSettings m_kSettings;
     Workers m_kWorkers;
-    std::map<size_t, CJobEnd> m_kEnded;         ///< that wait for an earlier one
-    size_t m_uiNext = 0;                        ///< job to be given out
-    size_t m_uiTaken = 0;                       ///< number of jobs whose ends were taken, from the first on
-    bool m_bRefused = false;                    ///< by the handler
-    std::optional<Clock::time_point> m_kEnding; ///< since when the run is to end
+    std::map<size_t, JobEnd> m_kEnded;        ///< that wait for an earlier one
+    size_t m_uiNext = 0;                      ///< job to be given out
+    size_t m_uiTaken = 0;                     ///< number of jobs whose ends were taken, from the first on
+    bool m_bRefused = false;                  ///< by the handler
+    std::optional<Clock::time_point> ending_; ///< since when the run is to end
 };
 
 } // namespace gw

@@ -137,15 +137,15 @@ void CWorkerProcess::LetCommit()
 // A process that is gone takes nothing; the next look at its socket tells.
 void CWorkerProcess::Send(size_t job)
 {
-    const CWorkerOrder order{job};
+    const WorkerOrder order{job};
     send(m_iSocket, &order, sizeof order, MSG_NOSIGNAL);
     m_eState = EState::Running;
     m_kSince = Clock::now();
 }
 
-bool CWorkerProcess::Receive(CJobEnd& end)
+bool CWorkerProcess::Receive(JobEnd& end)
 {
-    CWorkerReply reply;
+    WorkerReply reply;
     const ssize_t count = recv(m_iSocket, &reply, sizeof reply, MSG_DONTWAIT);
     if (count < 0 && (errno == EINTR || errno == EAGAIN))
         return false;
@@ -164,23 +164,23 @@ bool CWorkerProcess::Receive(CJobEnd& end)
     return true;
 }
 
-void CWorkerProcess::Kill(CJobEnd& end)
+void CWorkerProcess::Kill(JobEnd& end)
 {
     kill(m_iProcess, SIGKILL);
     Bury(end);
-    end.kind = CJobEnd::EKind::TimedOut;
+    end.kind = JobEnd::EKind::TimedOut;
 }
 
-void CWorkerProcess::Bury(CJobEnd& end)
+void CWorkerProcess::Bury(JobEnd& end)
 {
-    end.kind = CJobEnd::EKind::Died;
+    end.kind = JobEnd::EKind::Died;
     end.seconds = RunningSeconds();
     end.status = WaitFor(std::exchange(m_iProcess, -1));
     m_eState = EState::Gone;
     Drain(end);
 }
 
-void CWorkerProcess::Drain(CJobEnd& end)
+void CWorkerProcess::Drain(JobEnd& end)
 {
     end.output = TakeText(m_iOutput);
     end.words = TakeText(m_iWords);

@@ -9,7 +9,7 @@
 
 namespace gw {
 
-struct CWorkerReply;
+struct WorkerReply;
 
 /// A process that does jobs, as the program sees it. What the process prints goes to files in memory, which
 /// outlive it: the last words of one that died are told too.
@@ -44,9 +44,9 @@ public:
     void LetCommit();
     /// Takes what the process sends: then it waits for its turn, or its job has ended, or it is gone. `end`
     /// is filled when its job has ended; false when it has not.
-    bool Receive(CJobEnd& end);
+    bool Receive(JobEnd& end);
     /// Ends the process at once, and its job with it.
-    void Kill(CJobEnd& end);
+    void Kill(JobEnd& end);
     /// Tells the process that there is no more to do. It may still have to end.
     void Close();
 
@@ -55,8 +55,8 @@ private:
     bool Open();
     [[noreturn]] void Serve(CJobHandler& handler, ECommit commit, int socket);
     void Send(size_t job);
-    void Bury(CJobEnd& end);
-    void Drain(CJobEnd& end);
+    void Bury(JobEnd& end);
+    void Drain(JobEnd& end);
 
     using Clock = std::chrono::steady_clock;
 

@@ -48,7 +48,7 @@ public:
     // Takes a folder below the root, which ends in a separator, or the root itself.
     void Take(const std::string& below);
 
-    CSourceTree tree;
+    SourceFolder tree;
 
 private:
     bool MayEnter(const fs::directory_entry& entry);
@@ -104,8 +104,8 @@ bool CWalk::LeadsBack(const fs::path& link) const
 
 } // namespace
 
-CSourceTree WalkFolder(const std::string& folder, std::span<const std::string_view> extensions,
-                       const std::string& leftOut)
+SourceFolder WalkFolder(const std::string& folder, std::span<const std::string_view> extensions,
+                        const std::string& leftOut)
 {
     CWalk walk(folder, extensions);
     walk.LeaveOut(leftOut);

@@ -8,7 +8,7 @@
 namespace gw {
 
 /// The files that a walk through a folder found.
-struct CSourceTree
+struct SourceFolder
 {
     std::vector<std::string> files;      ///< below the folder: "b/walk.bvh"
     std::vector<std::string> unreadable; ///< folders below it that could not be read
@@ -18,7 +18,7 @@ struct CSourceTree
 /// Of each folder first its own files, by extension and then by name, then its folders by name. Every folder
 /// is taken once, wherever links lead; one is left out with all below it, unless it is the walked one itself:
 /// where the results go.
-CSourceTree WalkFolder(const std::string& folder, std::span<const std::string_view> extensions,
-                       const std::string& leftOut);
+SourceFolder WalkFolder(const std::string& folder, std::span<const std::string_view> extensions,
+                        const std::string& leftOut);
 
 } // namespace gw

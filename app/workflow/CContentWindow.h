@@ -16,7 +16,7 @@ class CCntComboExControl;
 
 /// What an open or save dialog begins with. A filter is pairs of text and pattern, "|" after each, "||" at
 /// the end.
-struct CFileDialogSetup
+struct FileDialogSetup
 {
     std::string defaultExtension; ///< without dot
     std::string filter;
@@ -25,7 +25,7 @@ struct CFileDialogSetup
 
 /// A folder that was chosen, with its trailing separator, and the number of the filter chosen with it, from 1
 /// on.
-struct CFolderChoice
+struct FolderChoice
 {
     std::string folder;
     int filterIndex = 1;
@@ -50,10 +50,10 @@ public:
     /// Shows a text until it is answered. The id is that of the message.
     virtual EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) = 0;
     /// A path, or none when the dialog was cancelled.
-    virtual std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) = 0;
+    virtual std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) = 0;
     /// The same; the dialog itself asks before a file is replaced.
-    virtual std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) = 0;
-    virtual std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) = 0;
+    virtual std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) = 0;
+    virtual std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) = 0;
     virtual bool IsKeyDown(EKey) const { return false; }
 
     // Words and progress

@@ -26,7 +26,7 @@ void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
 } // namespace
 
 CGaitConvertContent::CGaitConvertContent(CContentWindow& window, CPlatform& platform)
-    : m_kWindow(window), m_kPlatform(platform)
+    : window_(window), platform_(platform)
 {
     m_kResources.OpenLibrary(platform.DataFolder() + kResourceLibrary, platform.ThreadLocale());
 }
@@ -35,16 +35,16 @@ CGaitConvertContent::~CGaitConvertContent() = default;
 
 bool CGaitConvertContent::OnInitContent()
 {
-    m_pkSourceView = m_kWindow.CreateView("#cnt1");
-    m_pkResultView = m_kWindow.CreateView("#cnt2");
+    m_pkSourceView = window_.CreateView("#cnt1");
+    m_pkResultView = window_.CreateView("#cnt2");
     const int fontSize = ParseInt(Message(kListFontSizeMessage));
-    m_pkProfileCombo = &m_kWindow.CreateComboEx("#format", "pull", fontSize);
+    m_pkProfileCombo = &window_.CreateComboEx("#format", "pull", fontSize);
     m_pkProfileCombo->SetFont(Message(kListFontMessage), fontSize, fontSize);
     RefreshProfileList();
     m_pkProfileDialog = std::make_unique<CProfileEditorDialog>(*this);
     m_pkProfileDialog->SetNamesInUse(&m_kProfileNames);
     m_pkProfile = m_pkProfileDialog.get();
-    m_kWindow.SetChildScrollRange("|playbar", 0, kScrollRange);
+    window_.SetChildScrollRange("|playbar", 0, kScrollRange);
     UpdateControls();
     return m_pkSourceView && m_pkResultView;
 }
@@ -70,7 +70,7 @@ int CGaitConvertContent::OpenSource()
 {
     if (!ConfirmDiscard())
         return 0;
-    const auto path = m_kWindow.AskOpenFile({"bvh", Message(kOpenFilterMessage), SourceFolder()});
+    const auto path = window_.AskOpenFile({"bvh", Message(kOpenFilterMessage), SourceFolder()});
     return path ? Open(*path) : 1;
 }
 
@@ -92,8 +92,8 @@ int CGaitConvertContent::OpenDropped(const std::string& path)
 
 int CGaitConvertContent::Open(const std::string& path)
 {
-    m_kWindow.RedrawFrame();
-    const CWaitCursor wait(m_kWindow);
+    window_.RedrawFrame();
+    const CWaitCursor wait(window_);
     ForgetFailedSave();
     if (m_pkSourceView)
         m_pkSourceView->Stop();
@@ -166,12 +166,12 @@ CNode* CGaitConvertContent::SourceRoot() const
 
 std::string CGaitConvertContent::SourceFolder() const
 {
-    return m_kPlatform.ReadSetting(kFolderSetting);
+    return platform_.ReadSetting(kFolderSetting);
 }
 
 void CGaitConvertContent::RememberFolder(const std::string& path)
 {
-    m_kPlatform.WriteSetting(kFolderSetting, SplitPath(path).folder);
+    platform_.WriteSetting(kFolderSetting, SplitPath(path).folder);
 }
 
 std::string CGaitConvertContent::Message(int id) const
@@ -186,7 +186,7 @@ EAnswer CGaitConvertContent::ShowMessage(int id, EButtons buttons, std::span<con
     std::vector<std::string> arguments;
     for (const int number : numbers)
         arguments.push_back(std::to_string(number));
-    return m_kWindow.ShowMessageBox(id, FormatText(Message(id), arguments), buttons);
+    return window_.ShowMessageBox(id, FormatText(Message(id), arguments), buttons);
 }
 
 void CGaitConvertContent::SetTitle(const std::string& text)
@@ -198,12 +198,12 @@ void CGaitConvertContent::SetTitle(const std::string& text)
 void CGaitConvertContent::ShowTitle(const std::string& text)
 {
     const std::string product = Message(kTitleMessage);
-    m_kWindow.SetChildText("#title", text.empty() ? product : product + " - " + text);
+    window_.SetChildText("#title", text.empty() ? product : product + " - " + text);
 }
 
 void CGaitConvertContent::Report(const std::string& path, const CFailureRecord& record)
 {
-    ReportRecord(path, record, m_kChoices, [this](const CReport& report) { m_kWindow.Report(report); });
+    ReportRecord(path, record, m_kChoices, [this](const CReport& report) { window_.Report(report); });
 }
 
 } // namespace gw

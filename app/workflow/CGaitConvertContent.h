@@ -193,17 +193,17 @@ private:
     bool ProfileFits(const std::string& path);
     bool IsListed(const std::string& name) const;
 
-    CContentWindow& m_kWindow;
-    CPlatform& m_kPlatform;
+    CContentWindow& window_;
+    CPlatform& platform_;
     CResourceManager m_kResources;
     std::unique_ptr<CProfileEditorDialog> m_pkProfileDialog;
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
-    std::string m_kSourcePath;               ///< of the file that was opened last
-    CMotionFile m_kBaseMotion;               ///< base.htr as it is, for the editor's target tree
-    CMotionFile m_kResultMotion;             ///< base.htr again, into which the motion is baked
-    std::optional<FileStamp> m_kResultStamp; ///< of base.htr as read; null once the result was baked or posed
+    std::string m_kSourcePath;             ///< of the file that was opened last
+    CMotionFile m_kBaseMotion;             ///< base.htr as it is, for the editor's target tree
+    CMotionFile m_kResultMotion;           ///< base.htr again, into which the motion is baked
+    std::optional<FileStamp> resultStamp_; ///< of base.htr as read; null once the result was baked or posed
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;

@@ -7,13 +7,13 @@ template <class TWindow>
 class CWaitCursor
 {
 public:
-    explicit CWaitCursor(TWindow& window) : m_kWindow(window) { m_kWindow.BeginWaitCursor(); }
-    ~CWaitCursor() { m_kWindow.EndWaitCursor(); }
+    explicit CWaitCursor(TWindow& window) : window_(window) { window_.BeginWaitCursor(); }
+    ~CWaitCursor() { window_.EndWaitCursor(); }
     CWaitCursor(const CWaitCursor&) = delete;
     CWaitCursor& operator=(const CWaitCursor&) = delete;
 
 private:
-    TWindow& m_kWindow;
+    TWindow& window_;
 };
 
 } // namespace gw

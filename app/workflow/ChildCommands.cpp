@@ -95,13 +95,13 @@ bool CGaitConvertContent::ChildClick(std::string_view child)
 
 void CGaitConvertContent::RequestClose()
 {
-    m_kWindow.PostCloseRequest();
+    window_.PostCloseRequest();
 }
 
 // The left Ctrl key at the click is the only way to a batch conversion.
 void CGaitConvertContent::OpenSourceOrRunBatch()
 {
-    if (m_kWindow.IsKeyDown(EKey::LeftCtrl))
+    if (window_.IsKeyDown(EKey::LeftCtrl))
         RunBatch();
     else
         OpenSource();
@@ -112,7 +112,7 @@ void CGaitConvertContent::TogglePlay()
     const bool plays = m_pkSourceView && m_pkSourceView->IsPlaying();
     ForViews(plays ? &CMotionView::Stop : &CMotionView::Play);
     UpdateControls();
-    m_kWindow.SetTimer(kClockTimer, kClockMilliseconds);
+    window_.SetTimer(kClockTimer, kClockMilliseconds);
 }
 
 void CGaitConvertContent::StopAndRewind()
@@ -124,19 +124,19 @@ void CGaitConvertContent::StopAndRewind()
 void CGaitConvertContent::PlayResult()
 {
     OnResultView<&CMotionView::Play>();
-    m_kWindow.SetTimer(kResultTimer, kResultMilliseconds);
+    window_.SetTimer(kResultTimer, kResultMilliseconds);
 }
 
 void CGaitConvertContent::ToggleProfileEditor()
 {
     if (!m_pkProfileDialog)
         return;
-    const bool visible = m_kWindow.GetChildButtonState("%adv");
+    const bool visible = window_.GetChildButtonState("%adv");
     if (visible)
         m_pkProfileDialog->Show();
     else
         m_pkProfileDialog->Close();
-    m_kWindow.ShowProfileEditor(visible);
+    window_.ShowProfileEditor(visible);
 }
 
 void CGaitConvertContent::OnTimer(int id)
@@ -145,20 +145,20 @@ void CGaitConvertContent::OnTimer(int id)
         ForViews(&CMotionView::Advance);
     const CMotionView* const view = id == kClockTimer ? m_pkSourceView.get() : m_pkResultView.get();
     if (!view || !view->IsPlaying())
-        m_kWindow.KillTimer(id);
+        window_.KillTimer(id);
     UpdateControls();
 }
 
 void CGaitConvertContent::ChildMouseDown(std::string_view child)
 {
     if (EqualNoCase(child, kPlaybar))
-        m_kWindow.KillTimer(kClockTimer); // so that the clock does not pull at what the hand drags
+        window_.KillTimer(kClockTimer); // so that the clock does not pull at what the hand drags
 }
 
 void CGaitConvertContent::ChildMouseUp(std::string_view child)
 {
     if (EqualNoCase(child, kPlaybar))
-        m_kWindow.SetTimer(kClockTimer, kClockMilliseconds);
+        window_.SetTimer(kClockTimer, kClockMilliseconds);
 }
 
 void CGaitConvertContent::ChildScroll(std::string_view child, int value)

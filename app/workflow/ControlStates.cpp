@@ -137,13 +137,13 @@ void CGaitConvertContent::UpdateControls()
 {
     const uint32_t facts = ControlFacts();
     for (const Row& row : kControls)
-        m_kWindow.EnableChild(row.m_kChild, (facts & row.m_uiNeeds) == row.m_uiNeeds);
+        window_.EnableChild(row.m_kChild, (facts & row.m_uiNeeds) == row.m_uiNeeds);
     const bool plays = (facts & kSourcePlays) != 0;
-    m_kWindow.SetChildFace("play", plays ? 1 : 0);
-    m_kWindow.SetChildSecondState("play", plays);
-    m_kWindow.SetChildButtonState("%adv", m_pkProfileDialog && m_pkProfileDialog->IsVisible());
-    m_kWindow.SetChildScrollValue("|playbar", ScrollValue(Clock(m_pkSourceView.get())));
-    m_kWindow.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
+    window_.SetChildFace("play", plays ? 1 : 0);
+    window_.SetChildSecondState("play", plays);
+    window_.SetChildButtonState("%adv", m_pkProfileDialog && m_pkProfileDialog->IsVisible());
+    window_.SetChildScrollValue("|playbar", ScrollValue(Clock(m_pkSourceView.get())));
+    window_.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
     ShowHighlights();
     ShowChoices();
 }
@@ -160,8 +160,8 @@ void CGaitConvertContent::ShowChoices()
     std::string text = m_kChoices.align ? "aligned" : "";
     if (m_kChoices.faithful)
         text += text.empty() ? "faithful" : ", faithful";
-    m_kWindow.SetChildFace("options", text.empty() ? 0 : 1);
-    m_kWindow.SetChildText("#choices", text);
+    window_.SetChildFace("options", text.empty() ? 0 : 1);
+    window_.SetChildText("#choices", text);
 }
 
 void CGaitConvertContent::ShowHighlights()

@@ -20,11 +20,11 @@ constexpr const char* kFilter = "BVH file to HTR(*.bvh)|*.bvh|HTR file to ORN(*.
 int CGaitConvertContent::RunBatch(const std::string& initialFolder)
 {
     const auto choice =
-        m_kWindow.AskFolder({{}, kFilter, initialFolder.empty() ? SourceFolder() : initialFolder});
+        window_.AskFolder({{}, kFilter, initialFolder.empty() ? SourceFolder() : initialFolder});
     if (!choice)
         return 0;
-    m_kWindow.RedrawFrame();
-    const CWaitCursor wait(m_kWindow);
+    window_.RedrawFrame();
+    const CWaitCursor wait(window_);
     const EBatchJob job = choice->filterIndex == 1 ? EBatchJob::ToMotion : EBatchJob::ToContainer;
     const std::string folder = WithSeparator(choice->folder);
     const std::vector<std::string> names = FilesInFolder(folder, BatchSource(job));
@@ -50,7 +50,7 @@ EBatchStep CGaitConvertContent::RunBatchFile(EBatchJob job, const std::string& p
     const std::string arguments[] = {std::to_string(index + 1), SplitPath(path).stem};
     SetTitle(FormatText(Message(kBatchTitleMessage), arguments));
     ForViews(&CMotionView::Stop);
-    m_kWindow.StayPainted();
+    window_.StayPainted();
     const std::string output = WithExtension(path, BatchResult(job));
     return job == EBatchJob::ToMotion ? ConvertFile(path, output) : PackageFile(path, output);
 }
@@ -82,7 +82,7 @@ bool CGaitConvertContent::SelectProfileAgain()
     const std::string* const selected = list.GetItemText(list.GetCurSel());
     if (!selected)
     {
-        m_kWindow.Report(MakeReport({}, EMisfit::NoProfile));
+        window_.Report(MakeReport({}, EMisfit::NoProfile));
         ShowMessage(kCannotConvertMessage, EButtons::OK);
         return false;
     }

@@ -12,7 +12,7 @@ namespace gw {
 
 int CGaitConvertContent::ConvertMotion()
 {
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     ForgetFailedSave();
     ForViews(&CMotionView::Stop);
     ReloadResult();
@@ -31,14 +31,14 @@ int CGaitConvertContent::ConvertMotion()
 void CGaitConvertContent::LoadResult()
 {
     const std::optional<FileStamp> stamp = StampOf(BaseFile());
-    m_kResultStamp = m_kResultMotion.Load(BaseFile()) ? stamp : std::nullopt;
+    resultStamp_ = m_kResultMotion.Load(BaseFile()) ? stamp : std::nullopt;
 }
 
 // Every conversion starts with the skeleton as its file has it now. The first one after an open need not read
 // the file again, unless it has changed since.
 void CGaitConvertContent::ReloadResult()
 {
-    if (!m_kResultStamp || m_kResultStamp != StampOf(BaseFile()))
+    if (!resultStamp_ || resultStamp_ != StampOf(BaseFile()))
         LoadResult();
     Report(BaseFile(), m_kResultMotion.Record());
 }
@@ -51,14 +51,14 @@ bool CGaitConvertContent::Retarget(bool heedsShift)
     const bool fits =
         m_pkProfile->ApplyProfile(&retargeter, nullptr, nullptr) && m_pkProfile->HasRootMapping();
     CConversion conversion(Input(), m_kResultMotion, retargeter,
-                           [this](const CReport& report) { m_kWindow.Report(report); });
-    m_kResultStamp.reset();
+                           [this](const CReport& report) { window_.Report(report); });
+    resultStamp_.reset();
     if (!conversion.Prepare(fits, EAlignedJoints::Body))
     {
         ShowMessage(kCannotConvertMessage, EButtons::OK);
         return false;
     }
-    const bool useLegs = !heedsShift || !m_kWindow.IsKeyDown(EKey::LeftShift);
+    const bool useLegs = !heedsShift || !window_.IsKeyDown(EKey::LeftShift);
     conversion.Run(useLegs, [this](size_t done, size_t total) { ShowProgress(done, total); });
     const SourceTiming result = TimingOf(m_kResultMotion);
     if (m_pkResultView)
@@ -86,11 +86,11 @@ ConversionInput CGaitConvertContent::Input() const
 
 void CGaitConvertContent::ShowProgress(size_t done, size_t total)
 {
-    if (!m_kWindow.IsProgressDue())
+    if (!window_.IsProgressDue())
         return;
     const std::string percent = std::to_string(100 * done / total) + " %";
     ShowTitle(m_kTitle.empty() ? "Converting " + percent : m_kTitle + ", " + percent);
-    m_kWindow.StayPainted();
+    window_.StayPainted();
 }
 
 } // namespace gw

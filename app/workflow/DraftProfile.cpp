@@ -71,13 +71,13 @@ int CGaitConvertContent::DraftProfile()
     CNode* const target = m_kBaseMotion.motionRoot.Get();
     if (!SourceRoot() || !target || !m_pkProfile)
         return 0;
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     const SuggestedProfile draft = SuggestProfile(*SourceRoot(), *target);
     if (!draft.missing.empty())
     {
-        m_kWindow.ShowMessageBox(kOwnMessage,
-                                 "No human body was found in this motion, so no bone map can be drafted.",
-                                 EButtons::OK);
+        window_.ShowMessageBox(kOwnMessage,
+                               "No human body was found in this motion, so no bone map can be drafted.",
+                               EButtons::OK);
         return 0;
     }
     const std::string name = DraftName();
@@ -87,13 +87,13 @@ int CGaitConvertContent::DraftProfile()
         !file.Write(ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())) ||
         !file.Commit())
     {
-        m_kWindow.Report(MakeReport(path, {EFailure::WriteError, 0, {}}, false));
-        m_kWindow.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
+        window_.Report(MakeReport(path, {EFailure::WriteError, 0, {}}, false));
+        window_.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
         return 0;
     }
     OpenDraft(name);
     if (const std::string rows = UnsureRows(draft); !rows.empty())
-        m_kWindow.Report(Note(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows)));
+        window_.Report(Note(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows)));
     return 1;
 }
 
@@ -103,14 +103,14 @@ void CGaitConvertContent::OpenDraft(const std::string& name)
     RefreshProfileList();
     SelectProfileByName(name);
     m_pkProfileDialog->Show();
-    m_kWindow.ShowProfileEditor(true);
+    window_.ShowProfileEditor(true);
     UpdateControls();
 }
 
 // What a reader trips over is told in full where a person can unfold it.
 void CGaitConvertContent::ReportFindings(const std::string& path)
 {
-    if (!m_kWindow.ShowsFindings() || !HasExtension(path, ".bvh") || !IsShort(path))
+    if (!window_.ShowsFindings() || !HasExtension(path, ".bvh") || !IsShort(path))
         return;
     CFileExam exam;
     exam.ExamineBVH(path);
@@ -122,7 +122,7 @@ void CGaitConvertContent::ReportFindings(const std::string& path)
         report.where = finding.where;
         if (!FindingRemedy(finding).empty())
             report.words += " (" + std::string(FindingRemedy(finding)) + ')';
-        m_kWindow.Report(report);
+        window_.Report(report);
     }
 }
 

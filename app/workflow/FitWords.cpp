@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-std::string MissingLine(const CMissingBone& missing)
+std::string MissingLine(const MissingBone& missing)
 {
     const std::string place = missing.line == 0 ? "" : "line " + std::to_string(missing.line) + ": ";
     const std::string nearest =
@@ -34,7 +34,7 @@ std::string FitSummary(const CProfileFit& fit)
 std::string MissingLines(const CProfileFit& fit)
 {
     std::string lines;
-    for (const CMissingBone& missing : fit.missing)
+    for (const MissingBone& missing : fit.missing)
     {
         lines += lines.empty() ? "" : "\n";
         lines += MissingLine(missing);

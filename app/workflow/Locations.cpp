@@ -20,19 +20,19 @@ constexpr size_t kHelpNameLimit = 260; // characters
 
 std::string CGaitConvertContent::ExeFile(const std::string& name)
 {
-    return m_kPlatform.DataFolder() + name;
+    return platform_.DataFolder() + name;
 }
 
 std::string CGaitConvertContent::ProfileFile(const std::string& name)
 {
-    const std::string folder = CustomProfileFolder(m_kPlatform, Message(kCustomFolderKeyMessage));
-    m_kPlatform.MakeFolder(folder);
+    const std::string folder = CustomProfileFolder(platform_, Message(kCustomFolderKeyMessage));
+    platform_.MakeFolder(folder);
     return folder + name;
 }
 
 bool CGaitConvertContent::LocateHost(std::string& path)
 {
-    path = m_kPlatform.ReadHostKey(Message(kHostKeyMessage), Message(kHostProgramMessage));
+    path = platform_.ReadHostKey(Message(kHostKeyMessage), Message(kHostProgramMessage));
     if (path.empty())
         ShowMessage(kNoHostMessage, EButtons::OK);
     return !path.empty();
@@ -49,7 +49,7 @@ bool CGaitConvertContent::LocateHelp(std::string& path)
         return false;
     std::string name;
     path.clear();
-    if (!library.LoadString(kHelpFileString, m_kPlatform.ThreadLocale(), name))
+    if (!library.LoadString(kHelpFileString, platform_.ThreadLocale(), name))
         return true;
     path = folder + std::string(FirstCharacters(name, kHelpNameLimit));
     return FileExists(path);
@@ -60,11 +60,11 @@ void CGaitConvertContent::ShowHelp()
     std::string path;
     if (LocateHelp(path))
     {
-        m_kWindow.OpenHelpFile(path + Message(kHelpTopicMessage));
+        window_.OpenHelpFile(path + Message(kHelpTopicMessage));
         return;
     }
-    const std::string language[] = {std::string(LanguageCode(m_kPlatform.ThreadLocale()))};
-    m_kWindow.OpenWebPage(FormatText(Message(kWebPageMessage), language));
+    const std::string language[] = {std::string(LanguageCode(platform_.ThreadLocale()))};
+    window_.OpenWebPage(FormatText(Message(kWebPageMessage), language));
 }
 
 } // namespace gw

@@ -190,7 +190,7 @@ void CGaitConvertContent::LoadSelectedProfile()
 void CGaitConvertContent::ProfileStateChanged()
 {
     UpdateControls();
-    m_kWindow.RefreshProfileEditor();
+    window_.RefreshProfileEditor();
 }
 
 void CGaitConvertContent::ProfileSetChanged()
@@ -205,12 +205,12 @@ void CGaitConvertContent::ProfileSetChanged()
         list.AddItem(name, kCustom);
     list.SetCurSel(FindItem(list, name));
     UpdateControls();
-    m_kWindow.RefreshProfileEditor();
+    window_.RefreshProfileEditor();
 }
 
 bool CGaitConvertContent::RunBoneOffset(CBoneOffsetDialog& dialog)
 {
-    return m_kWindow.RunBoneOffset(dialog);
+    return window_.RunBoneOffset(dialog);
 }
 
 } // namespace gw

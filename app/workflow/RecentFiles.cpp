@@ -14,7 +14,7 @@ constexpr size_t kRecentCount = 8;
 
 std::vector<std::string> CGaitConvertContent::RecentFiles() const
 {
-    const std::string setting = m_kPlatform.ReadSetting(kRecentSetting);
+    const std::string setting = platform_.ReadSetting(kRecentSetting);
     std::vector<std::string> paths;
     std::string_view rest = setting;
     for (std::string_view line; paths.size() < kRecentCount && NextLine(rest, line);)
@@ -33,7 +33,7 @@ void CGaitConvertContent::AddRecentFile(const std::string& path)
     std::string setting;
     for (size_t i = 0; i < paths.size() && i < kRecentCount; ++i)
         setting += paths[i] + '\n';
-    m_kPlatform.WriteSetting(kRecentSetting, setting);
+    platform_.WriteSetting(kRecentSetting, setting);
 }
 
 } // namespace gw

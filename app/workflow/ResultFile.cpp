@@ -67,7 +67,7 @@ bool PackageMotionFile(const std::string& path, const std::string& output, CFail
 
 std::string WithExtension(const std::string& path, std::string_view extension)
 {
-    const CPathParts parts = SplitPath(path);
+    const PathParts parts = SplitPath(path);
     return parts.folder + parts.stem + std::string(extension);
 }
 

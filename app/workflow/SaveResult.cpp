@@ -18,10 +18,10 @@ constexpr const char* kNotSaved = "not saved: "; // begins the title after a fai
 
 int CGaitConvertContent::SaveResult()
 {
-    const auto path = m_kWindow.AskSaveFile({"Kinetra", Message(kSaveFilterMessage), {}});
+    const auto path = window_.AskSaveFile({"Kinetra", Message(kSaveFilterMessage), {}});
     if (!path)
         return 1;
-    const CWaitCursor wait(m_kWindow);
+    const CWaitCursor wait(window_);
     WriteResult(*path);
     m_bSaved = true; // even if it was not: the title and the box report that
     std::string title;
@@ -33,8 +33,8 @@ int CGaitConvertContent::SaveResult()
         text = "Nothing was written.\n" + ReportLine(report) + "\n\n" + text;
     }
     SetTitle(title);
-    if (m_kWindow.ShowMessageBox(kShowFileMessage, text, EButtons::OKCancel) == EAnswer::OK)
-        m_kWindow.ShowInFileManager(*path);
+    if (window_.ShowMessageBox(kShowFileMessage, text, EButtons::OKCancel) == EAnswer::OK)
+        window_.ShowInFileManager(*path);
     return 1;
 }
 

@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-using Row = std::vector<CPixelRGBA>;
+using Row = std::vector<PixelRGBA>;
 
 // Beyond it only the first and the last rows are looked at: a BMP file has a row size of a gigabyte for the
 // asking, but its rows take the time that they take.
@@ -17,20 +17,20 @@ constexpr int64_t kMostPixels = 1 << 20;
 
 Row RowOf(CPicture& picture, int y)
 {
-    const CPictureBox box = picture.Box();
+    const PictureBox box = picture.Box();
     Row row(static_cast<size_t>(box.width));
     return picture.ReadRowRGBA(y, 0, box.width, row.data()) ? row : Row();
 }
 
-bool HaveOneColor(const CPixelRGBA& a, const CPixelRGBA& b)
+bool HaveOneColor(const PixelRGBA& a, const PixelRGBA& b)
 {
     return a.r == b.r && a.g == b.g && a.b == b.b;
 }
 
 void RequireRefusal(CPicture& picture)
 {
-    const CPictureBox box = picture.Box();
-    CPixelRGBA pixel[2] = {};
+    const PictureBox box = picture.Box();
+    PixelRGBA pixel[2] = {};
     Require(!picture.ReadRowRGBA(box.height, 0, 1, pixel), "no row below the last can be read");
     Require(!picture.ReadRowRGBA(-1, 0, 1, pixel), "no row above the first can be read");
     Require(!picture.ReadRowRGBA(0, box.width - 1, 2, pixel), "no column behind the last can be read");
@@ -40,7 +40,7 @@ void RequireRefusal(CPicture& picture)
 
 bool ReadsWhole(CPicture& picture)
 {
-    const CPictureBox box = picture.Box();
+    const PictureBox box = picture.Box();
     Require(box.width > 0 && box.height > 0, "a picture has pixels");
     RequireRefusal(picture);
     if (int64_t{box.width} * box.height > kMostPixels)
@@ -57,7 +57,7 @@ bool ReadsWhole(CPicture& picture)
 
 void RequireSameCopy(CPicture& picture, const std::string& path)
 {
-    const CPictureBox box = picture.Box();
+    const PictureBox box = picture.Box();
     const auto copy = OpenPicture(path, "w");
     Require(copy && copy->SetChannelCount(3) && copy->SetSize(box), "a copy can be begun");
     // Written from the top on.

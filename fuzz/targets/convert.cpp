@@ -36,7 +36,7 @@ void FuzzOne(std::span<const std::byte> input)
     if (input.empty())
         return;
     const auto way = static_cast<uint8_t>(input.front());
-    COptions options;
+    ShellOptions options;
     options.files = {ScratchFile(way & kContainer ? "in.orn" : "in.bvh", input.subspan(1))};
     options.output = ScratchPath(way & kPackaged ? "out.Kinetra" : "out.htr");
     options.dataFolder = GAITWRIGHT_ASSETS;

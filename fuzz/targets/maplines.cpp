@@ -16,7 +16,7 @@ std::string_view WithoutReturns(std::string_view text)
     return text.substr(0, text.find_last_not_of('\r') + 1);
 }
 
-bool SayTheSame(const CMapLine& a, const CMapLine& b)
+bool SayTheSame(const MapLine& a, const MapLine& b)
 {
     return a.kind == b.kind && a.source == b.source && a.target == b.target &&
            WithoutReturns(a.text) == WithoutReturns(b.text);
@@ -26,7 +26,7 @@ bool SayTheSame(const CMapLine& a, const CMapLine& b)
 
 void FuzzOne(std::span<const std::byte> input)
 {
-    std::vector<CMapLine> lines, again;
+    std::vector<MapLine> lines, again;
     if (!ReadMapLines(ScratchFile("in.map", input), lines))
         return Require(input.size() > kProfileByteLimit, "every text is a map");
     const std::string out = ScratchPath("out.map");
@@ -36,8 +36,8 @@ void FuzzOne(std::span<const std::byte> input)
     Require(std::ranges::equal(lines, again, SayTheSame), "lines survive a save");
 
     CMapLineList list;
-    list.Replace(lines, [](const CMapLine&) { return true; });
-    for (const CMapLine& line : list.Lines())
+    list.Replace(lines, [](const MapLine&) { return true; });
+    for (const MapLine& line : list.Lines())
         RewrittenLine(line);
 }
 

@@ -19,7 +19,7 @@ bool IsSameEntry(const CRunPlan::Entry& a, const CRunPlan::Entry& b)
 // out.
 void CheckOptions(const std::string& text)
 {
-    COptions first, second;
+    ShellOptions first, second;
     std::string wrong;
     if (!ReadOptionsJson(text, ~uint64_t{0}, first, wrong))
         return;

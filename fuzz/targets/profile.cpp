@@ -18,7 +18,7 @@ struct ReadRows
     {
         CProfileReader reader(text);
         name = reader.Name();
-        for (CProfileLine line; reader.Next(line);)
+        for (ProfileLine line; reader.Next(line);)
         {
             if (line.kind == EProfileLine::Position)
                 position = line.position;
@@ -29,7 +29,7 @@ struct ReadRows
         }
     }
 
-    void Add(const CProfileLine& line)
+    void Add(const ProfileLine& line)
     {
         rows.AddRow(line.source, line.target, line.numbers, ERowColumns::All);
         isWhole = isWhole && !line.source.empty() && !line.target.empty();
@@ -48,8 +48,8 @@ struct ReadRows
 // without a source has no use for a rotation.
 bool IsSameRow(const CMapRowTable& a, const CMapRowTable& b, int row)
 {
-    const CRowNumbers one = a.Numbers(row);
-    const CRowNumbers two = b.Numbers(row);
+    const RowNumbers one = a.Numbers(row);
+    const RowNumbers two = b.Numbers(row);
     return a.Text(row, kSourceColumn) == b.Text(row, kSourceColumn) &&
            a.Text(row, kTargetColumn) == b.Text(row, kTargetColumn) && one.axes == two.axes &&
            (a.IsFixed(row) || one.rotation == two.rotation);

@@ -10,7 +10,7 @@
 
 namespace gw {
 
-struct CWatchedRange;
+struct WatchedRange;
 
 /// The bytes of a regular file, mapped and not copied; a small one is read, which costs less. Folders and
 /// devices are refused. An empty file maps to no bytes. Bytes that a file loses while it is mapped read as
@@ -47,8 +47,8 @@ private:
     std::unique_ptr<std::byte[]> m_spkSmall; // where the bytes are not mapped
     const std::byte* m_pkBytes = nullptr;
     size_t m_uiSize = 0;
-    int m_iFile = -1;                   // of a mapping
-    CWatchedRange* m_pkRange = nullptr; // likewise
+    int m_iFile = -1;                  // of a mapping
+    WatchedRange* m_pkRange = nullptr; // likewise
 };
 
 } // namespace gw

@@ -19,18 +19,18 @@ constexpr int kEndSignals[] = {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCP
 constexpr pid_t kFree = 0;
 constexpr pid_t kChanging = -1;
 
-struct CSlot
+struct NameSlot
 {
     std::atomic<pid_t> owner{kFree};
     char path[kPathBytes] = {};
 };
 
-CSlot g_kSlots[16]; // a program writes one or two files at a time
+NameSlot g_kSlots[16]; // a program writes one or two files at a time
 
 void EndBySignal(int signal)
 {
     const pid_t self = getpid();
-    for (const CSlot& slot : g_kSlots)
+    for (const NameSlot& slot : g_kSlots)
     {
         if (slot.owner == self)
             unlink(slot.path);
@@ -44,7 +44,7 @@ int AddLiveName(const std::string& path)
 {
     if (path.size() >= kPathBytes)
         return -1;
-    for (CSlot& slot : g_kSlots)
+    for (NameSlot& slot : g_kSlots)
     {
         pid_t expected = kFree;
         if (!slot.owner.compare_exchange_strong(expected, kChanging))

@@ -145,7 +145,7 @@ ENumber KindInRow(const char* next, const char* end)
 }
 
 // The numbers below 1000 as text, from the left, for what stands before the point and in threes behind it.
-struct CTriple
+struct Triple
 {
     char padded[4]; // the fourth only fills a word, which is copied faster than three bytes
     char plain[3];
@@ -153,10 +153,10 @@ struct CTriple
 };
 
 constexpr auto kTriples = [] {
-    std::array<CTriple, 1000> rows{};
+    std::array<Triple, 1000> rows{};
     for (int i = 0; i < 1000; ++i)
     {
-        CTriple& row = rows[static_cast<size_t>(i)];
+        Triple& row = rows[static_cast<size_t>(i)];
         row.length = i < 10 ? 1 : i < 100 ? 2 : 3;
         for (int k = 0, divisor = 100; k < 3; ++k, divisor /= 10)
             row.padded[k] = static_cast<char>('0' + i / divisor % 10);
@@ -181,7 +181,7 @@ char* WriteWhole(char* out, uint64_t number)
 {
     if (number >= kTriples.size())
         return std::to_chars(out, out + kFixed6Bytes, number).ptr;
-    const CTriple& row = kTriples[number];
+    const Triple& row = kTriples[number];
     std::memcpy(out, row.plain, 3);
     return out + row.length;
 }

@@ -42,7 +42,7 @@ bool IsRegular(const std::string& path)
 
 } // namespace
 
-CPathParts SplitPath(std::string_view path)
+PathParts SplitPath(std::string_view path)
 {
     const size_t nameBegin = path.find_last_of(kSeparators) + 1; // npos + 1 is 0
     const std::string_view name = path.substr(nameBegin);

@@ -8,7 +8,7 @@
 namespace gw {
 
 /// A path in its parts. Both separators are understood; what is joined uses the platform's.
-struct CPathParts
+struct PathParts
 {
     std::string folder;    ///< drive and directory with the trailing separator, or empty
     std::string stem;      ///< file name without extension
@@ -22,7 +22,7 @@ inline constexpr char kPathSeparator =
     '/';
 #endif
 
-CPathParts SplitPath(std::string_view path);
+PathParts SplitPath(std::string_view path);
 /// Whether a path's extension, dot included, equals the one asked for without regard to case.
 bool HasExtension(std::string_view path, std::string_view extension);
 /// A folder with a separator at its end; empty stays empty.

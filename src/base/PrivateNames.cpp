@@ -118,24 +118,24 @@ bool ReadPart(std::string_view name, size_t part, uint32_t& number)
     return error == std::errc() && end == digits + kDigits;
 }
 
-struct CNameParts
+struct NameParts
 {
     uint32_t machine, program, random;
 };
 
-bool ReadParts(std::string_view name, CNameParts& parts)
+bool ReadParts(std::string_view name, NameParts& parts)
 {
     return IsPrivateName(name) && ReadPart(name, 0, parts.machine) && ReadPart(name, 1, parts.program) &&
            ReadPart(name, 2, parts.random);
 }
 
-bool IsGone(const CNameParts& parts)
+bool IsGone(const NameParts& parts)
 {
     return parts.machine == MachineNumber() && parts.program != 0 &&
            kill(static_cast<pid_t>(parts.program), 0) != 0 && errno == ESRCH;
 }
 
-bool IsDead(int file, const CNameParts& parts, const struct stat& status)
+bool IsDead(int file, const NameParts& parts, const struct stat& status)
 {
     const ELock lock = Lock(file);
     if (lock == ELock::Taken)
@@ -144,7 +144,7 @@ bool IsDead(int file, const CNameParts& parts, const struct stat& status)
            time(nullptr) - status.st_mtime > kOldSeconds;
 }
 
-void RemoveIfDead(const std::string& path, const CNameParts& parts)
+void RemoveIfDead(const std::string& path, const NameParts& parts)
 {
     struct stat status;
     if (lstat(path.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
@@ -167,7 +167,7 @@ void Sweep(const std::string& folder, size_t entryLimit)
         const dirent* const entry = readdir(directory.get());
         if (!entry)
             return;
-        CNameParts parts;
+        NameParts parts;
         if (ReadParts(entry->d_name, parts))
             RemoveIfDead(WithSeparator(folder) + entry->d_name, parts);
     }

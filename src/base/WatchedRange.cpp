@@ -17,13 +17,13 @@ namespace gw {
 
 namespace {
 
-CWatchedRange g_kRanges[64];
+WatchedRange g_kRanges[64];
 struct sigaction g_kBefore;
 uintptr_t g_uiPageSize;
 
 bool PatchAt(uintptr_t address)
 {
-    for (CWatchedRange& range : g_kRanges)
+    for (WatchedRange& range : g_kRanges)
     {
         const uintptr_t begin = range.begin;
         const uintptr_t end = range.end;
@@ -66,11 +66,11 @@ bool Install()
 
 } // namespace
 
-CWatchedRange* Watch(const void* begin, size_t byteCount)
+WatchedRange* Watch(const void* begin, size_t byteCount)
 {
     constexpr uintptr_t kClaimed = 1; // no mapping begins there
     static const bool installed = Install();
-    for (CWatchedRange& range : g_kRanges)
+    for (WatchedRange& range : g_kRanges)
     {
         uintptr_t expected = 0;
         if (!installed || !range.begin.compare_exchange_strong(expected, kClaimed))
@@ -83,7 +83,7 @@ CWatchedRange* Watch(const void* begin, size_t byteCount)
     return nullptr;
 }
 
-void Unwatch(CWatchedRange* range)
+void Unwatch(WatchedRange* range)
 {
     if (!range)
         return;

@@ -8,7 +8,7 @@ namespace gw {
 
 /// A mapped range of a file. Reading a page that the file has lost since gives zeros and marks the range,
 /// where it would otherwise end the program with SIGBUS.
-struct CWatchedRange
+struct WatchedRange
 {
     std::atomic<uintptr_t> begin{0}; ///< 0: free
     std::atomic<uintptr_t> end{0};
@@ -16,7 +16,7 @@ struct CWatchedRange
 };
 
 /// Watches a mapping until Unwatch, which must come before it is unmapped. Null when too many are watched.
-CWatchedRange* Watch(const void* begin, size_t byteCount);
-void Unwatch(CWatchedRange* range);
+WatchedRange* Watch(const void* begin, size_t byteCount);
+void Unwatch(WatchedRange* range);
 
 } // namespace gw

@@ -61,7 +61,7 @@ void CBoneSkinControl::Fields(CFieldArchive& archive)
     archive.Array("m_kBones", m_kBones, [](CFieldArchive& bones, CSkinBoneRecord& record) {
         bones.PlainLink("m_pkBone", record.m_pkBone);
         bones.Matrix("m_kOffset", record.m_kOffset);
-        bones.Array("m_kInfluences", record.m_kInfluences, [](CFieldArchive& pairs, CSkinInfluence& pair) {
+        bones.Array("m_kInfluences", record.m_kInfluences, [](CFieldArchive& pairs, SkinInfluence& pair) {
             pairs.Unsigned("SkinID", pair.SkinID);
             pairs.Float("SkinWeight", pair.SkinWeight);
         });
@@ -80,9 +80,9 @@ uint64_t CBoneSkinControl::GetMemoryUsed() const
     uint64_t bytes = CControl::GetMemoryUsed() + 36 + m_kPoints.size() * sizeof(CSkinPointRecord) +
                      m_kPointBones.size() * kInfluenceBytes;
     for (const auto& row : m_kGroups)
-        bytes += row.size() * sizeof(CSkinPointRun);
+        bytes += row.size() * sizeof(SkinPointRun);
     for (const CSkinBoneRecord& record : m_kBones)
-        bytes += 80 + record.m_kInfluences.size() * sizeof(CSkinInfluence);
+        bytes += 80 + record.m_kInfluences.size() * sizeof(SkinInfluence);
     return bytes;
 }
 
@@ -100,7 +100,7 @@ CSkinBoneRecord& CBoneSkinControl::RecordOf(CSpatial& bone, const Mat4& offset)
 
 void CBoneSkinControl::AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset)
 {
-    std::vector<CSkinInfluence>& influences = RecordOf(bone, offset).m_kInfluences;
+    std::vector<SkinInfluence>& influences = RecordOf(bone, offset).m_kInfluences;
     influences.insert(influences.begin(), {point, weight});
 }
 
@@ -120,7 +120,7 @@ std::vector<CBoneSkinControl::Influence> CBoneSkinControl::SortedInfluences() co
     {
         if (!m_kTableBones[place])
             continue;
-        for (const CSkinInfluence& influence : m_kBones[place].m_kInfluences)
+        for (const SkinInfluence& influence : m_kBones[place].m_kInfluences)
         {
             if (influence.SkinWeight != 0.0f && influence.SkinID < m_uiTablePoints)
                 influences.push_back({influence.SkinID, place, influence.SkinWeight});
@@ -135,7 +135,7 @@ void CBoneSkinControl::AddToGroup(size_t influences, uint32_t begin, uint32_t en
     if (begin == end)
         return;
     m_kGroups.resize(std::max(m_kGroups.size(), influences + 1));
-    std::vector<CSkinPointRun>& row = m_kGroups[influences];
+    std::vector<SkinPointRun>& row = m_kGroups[influences];
     if (!row.empty() && row.back().end == begin)
         row.back().end = end;
     else
@@ -198,7 +198,7 @@ bool CBoneSkinControl::Bind(CObject& root)
         if (!bone)
             continue;
         // As if added one by one, each in front of the others.
-        std::vector<CSkinInfluence>& influences = RecordOf(*bone, record.m_kOffset).m_kInfluences;
+        std::vector<SkinInfluence>& influences = RecordOf(*bone, record.m_kOffset).m_kInfluences;
         influences.insert(influences.begin(), record.m_kInfluences.rbegin(), record.m_kInfluences.rend());
     }
     RebuildSkinTables();
@@ -237,14 +237,14 @@ bool CBoneSkinControl::Update(float)
     // Behind a control that has already put the points into the world they first go back to the model.
     const std::vector<Mat4> matrices =
         SkinMatrices(target->m_bWorldValid ? Mat4InverseOrIdentity(world) : kMat4Identity);
-    for (const CSkinPointRun& run : m_kGroups.front())
+    for (const SkinPointRun& run : m_kGroups.front())
     {
         for (uint32_t point = run.begin; point < run.end; ++point)
             points[point] = TransformCoord(points[point], world);
     }
     for (size_t group = 1; group < m_kGroups.size(); ++group)
     {
-        for (const CSkinPointRun& run : m_kGroups[group])
+        for (const SkinPointRun& run : m_kGroups[group])
             MovePoints(std::span(m_kPoints).subspan(run.record, run.end - run.begin), matrices, world,
                        points);
     }

@@ -11,7 +11,7 @@ namespace gw {
 class CSpatial;
 
 /// How much a bone moves one point.
-struct CSkinInfluence
+struct SkinInfluence
 {
     uint32_t SkinID = 0;     ///< index of the point; one that the target does not have is kept and has no say
     float SkinWeight = 0.0f; ///< of any size; 0 has no say
@@ -22,7 +22,7 @@ struct CSkinBoneRecord
 {
     Watch<CSpatial> m_pkBone;
     Mat4 m_kOffset = kMat4Identity; ///< from the mesh's model space to the bone's
-    std::vector<CSkinInfluence> m_kInfluences;
+    std::vector<SkinInfluence> m_kInfluences;
 };
 
 /// What moves one point: its bones, in the order of the bone table, and as many weights, none of them 0. A
@@ -37,7 +37,7 @@ struct CSkinPointRecord
 
 /// Points from `begin` up to `end` with the same number of influences. A group is kept as runs of points, so
 /// that many skins on one large mesh do not take its size each.
-struct CSkinPointRun
+struct SkinPointRun
 {
     uint32_t begin;
     uint32_t end;
@@ -79,7 +79,7 @@ public:
     const std::vector<CSkinPointRecord>& Points() const { return m_kPoints; }
     /// Row g has the points with exactly g influences, in ascending order; row 0 those that no bone moves.
     /// There is one row more than the most influences of any point.
-    const std::vector<std::vector<CSkinPointRun>>& Groups() const { return m_kGroups; }
+    const std::vector<std::vector<SkinPointRun>>& Groups() const { return m_kGroups; }
 
 private:
     struct Influence
@@ -100,7 +100,7 @@ private:
 
     // Derived from the bones and the number of points below. A copy starts without them and makes its own.
     std::vector<CSkinPointRecord> m_kPoints;
-    std::vector<std::vector<CSkinPointRun>> m_kGroups;
+    std::vector<std::vector<SkinPointRun>> m_kGroups;
     std::vector<CSpatial*> m_kPointBones;
     std::vector<float> m_kPointWeights;
     std::vector<uint32_t> m_kPointPlaces;

@@ -19,7 +19,7 @@ namespace gw {
 namespace {
 
 // The bone meshes are absent on purpose: they can be written, and a file that holds one cannot be read back.
-constexpr CFactoryRow kClasses[] = {
+constexpr FactoryRow kClasses[] = {
     {&CGeometry::ms_kRTTI,             MakeNothing                      },
     {&CTriMesh::ms_kRTTI,              MakeObject<CTriMesh>             },
     {&CTriMeshUVWMap::ms_kRTTI,        MakeObject<CTriMeshUVWMap>       },

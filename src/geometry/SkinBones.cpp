@@ -10,7 +10,7 @@ CSpatial* CBonesByName::Find(const CSpatial* bone)
         return nullptr;
     const auto [known, isNew] = m_kFound.try_emplace(bone);
     if (isNew)
-        known->second = static_cast<CNode*>(m_kRoot.FindObject(bone->GetName(), &CNode::ms_kRTTI, true));
+        known->second = static_cast<CNode*>(root_.FindObject(bone->GetName(), &CNode::ms_kRTTI, true));
     return known->second;
 }
 

@@ -13,14 +13,14 @@ class CSpatial;
 class CBonesByName
 {
 public:
-    explicit CBonesByName(CObject& root) : m_kRoot(root) {}
+    explicit CBonesByName(CObject& root) : root_(root) {}
 
     /// The first node that has a bone's name, derived classes included; null for no bone, a bone without a
     /// name and a name that is not there.
     CSpatial* Find(const CSpatial* bone);
 
 private:
-    CObject& m_kRoot;
+    CObject& root_;
     std::unordered_map<const CSpatial*, CSpatial*> m_kFound;
 };
 

@@ -43,7 +43,7 @@ void CAnmImage::Fields(CFieldArchive& archive)
     m_kLink.Field(archive);
     if (!m_kLink.IsNull())
         return;
-    archive.Array("frames", m_kFrames, [](CFieldArchive& fields, CFilmFrame& frame) {
+    archive.Array("frames", m_kFrames, [](CFieldArchive& fields, FilmFrame& frame) {
         fields.Unsigned("timing", frame.m_uiTiming);
         fields.Unsigned("delay", frame.m_uiDelay);
         fields.Signed("left", frame.m_iLeft);
@@ -69,7 +69,7 @@ bool CAnmImage::Register(COrrinStream& stream)
 void CAnmImage::CloneHeld(CCloneMap& map, CObject& copy)
 {
     CObject::CloneHeld(map, copy);
-    std::vector<CFilmFrame>& frames = static_cast<CAnmImage&>(copy).m_kFrames;
+    std::vector<FilmFrame>& frames = static_cast<CAnmImage&>(copy).m_kFrames;
     for (size_t i = 0; i < m_kFrames.size(); ++i)
     {
         if (CImage* image = m_kFrames[i].m_spkImage.Get())
@@ -83,11 +83,11 @@ uint64_t CAnmImage::GetMemoryUsed() const
     return CObject::GetMemoryUsed() + 8 + m_kLink.MemoryUsed() + m_kFrames.size() * kFrameBytes;
 }
 
-bool CAnmImage::Load(const std::string& path, CLinkedPictures* memory)
+bool CAnmImage::Load(const std::string& path, PictureMemory* memory)
 {
     m_kFrames.clear();
-    const auto take = [&](const CPictureHead& head) -> CPixelBuffer& {
-        CFilmFrame& frame = m_kFrames.emplace_back();
+    const auto take = [&](const PictureHead& head) -> CPixelBuffer& {
+        FilmFrame& frame = m_kFrames.emplace_back();
         frame.m_uiDelay = head.delay;
         frame.m_iLeft = head.left;
         frame.m_iTop = head.top;
@@ -100,9 +100,9 @@ bool CAnmImage::Load(const std::string& path, CLinkedPictures* memory)
     return good;
 }
 
-const CFilmFrame& CAnmImage::GetFrame(size_t index) const
+const FilmFrame& CAnmImage::GetFrame(size_t index) const
 {
-    static const CFilmFrame none;
+    static const FilmFrame none;
     return index < m_kFrames.size() ? m_kFrames[index] : none;
 }
 

@@ -12,7 +12,7 @@ namespace gw {
 class CImage;
 
 /// One picture of a film.
-struct CFilmFrame
+struct FilmFrame
 {
     uint32_t m_uiTiming = 0; ///< stored and copied only
     uint32_t m_uiDelay = 0;  ///< hundredths of a second until the next frame
@@ -42,13 +42,13 @@ public:
 
     /// Reads all frames of an animated file, each into its own image. False, with an empty film, if it cannot
     /// be read or there is no room for it.
-    bool Load(const std::string& path, CLinkedPictures* memory = nullptr);
+    bool Load(const std::string& path, PictureMemory* memory = nullptr);
 
     size_t GetFrameCount() const { return m_kFrames.size(); }
     /// The frame; out of range one without an image.
-    const CFilmFrame& GetFrame(size_t index) const;
+    const FilmFrame& GetFrame(size_t index) const;
     /// Takes a frame over with its image.
-    void AddFrame(CFilmFrame&& frame) { m_kFrames.push_back(std::move(frame)); }
+    void AddFrame(FilmFrame&& frame) { m_kFrames.push_back(std::move(frame)); }
 
     /// The file that the film stands for, or null for an embedded one.
     const char* GetLinkFileName() const { return m_kLink.GetFileName(); }
@@ -61,7 +61,7 @@ protected:
 
 private:
     CPictureLink m_kLink;
-    std::vector<CFilmFrame> m_kFrames;
+    std::vector<FilmFrame> m_kFrames;
 };
 
 } // namespace gw

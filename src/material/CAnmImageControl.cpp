@@ -22,7 +22,7 @@ std::vector<float> FrameTimes(const CAnmImage& film)
     return times;
 }
 
-void Draw(const CFilmFrame& frame, CImage& target)
+void Draw(const FilmFrame& frame, CImage& target)
 {
     if (!frame.m_spkImage)
         return;

@@ -100,7 +100,7 @@ void CImage::MakeJPEG()
     m_uiJPEGRevision = m_kPixels.GetRevision();
 }
 
-bool CImage::Load(const std::string& path, CLinkedPictures* memory)
+bool CImage::Load(const std::string& path, PictureMemory* memory)
 {
     m_bDecoded = true;
     return ReadPicture(path, m_kPixels, memory);

@@ -35,7 +35,7 @@ public:
 
     /// Reads a picture file into the pixels. False, with an empty image, if it cannot be read or there is no
     /// room for it.
-    bool Load(const std::string& path, CLinkedPictures* memory = nullptr);
+    bool Load(const std::string& path, PictureMemory* memory = nullptr);
     /// Writes a picture file of the format that its extension tells; quality goes from 1 to 100.
     bool Save(const std::string& path, int32_t quality);
 

@@ -9,7 +9,7 @@
 namespace gw {
 
 /// What is known of a picture before its pixels come.
-struct CPictureHead
+struct PictureHead
 {
     int32_t width = 0;
     int32_t height = 0;
@@ -22,7 +22,7 @@ struct CPictureHead
 
 /// Gives the place for a picture's pixels, rows of width x 4 bytes (blue, green, red, alpha) without gaps, or
 /// null to stop.
-using CPictureSink = std::function<uint8_t*(const CPictureHead&)>;
+using CPictureSink = std::function<uint8_t*(const PictureHead&)>;
 
 /// Pictures as the bytes of their files. The format is told by its name ("PNG"), never guessed. It stands in
 /// a module of its own, loaded when the first picture is met; see LoadPictureCodec. Nothing here throws.
@@ -36,7 +36,7 @@ public:
                         const CPictureSink& sink) = 0;
     /// Makes a file of rows without gaps, 3 or 4 bytes a pixel. Quality goes from 1 to 100 and is for formats
     /// that have such a thing.
-    virtual bool Encode(const CPictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel,
+    virtual bool Encode(const PictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel,
                         const char* format, int32_t quality, std::vector<uint8_t>& file) = 0;
 };
 

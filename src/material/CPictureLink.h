@@ -44,7 +44,7 @@ private:
 template <class T>
 void ReadLinkedFile(T& picture, COrrinStream& stream)
 {
-    CLinkedPictures& memory = stream.LinkedPictures();
+    PictureMemory& memory = stream.LinkedPictures();
     if (!picture.PictureLink().IsUnread() || memory.m_uiByteLimit == 0)
         return;
     const std::string path = picture.GetLinkFileName();

@@ -102,7 +102,7 @@ class CPixelAccess
 {
 public:
     explicit CPixelAccess(TBuffer& buffer)
-        : m_kBuffer(buffer), m_uiStride(buffer.GetStride()), m_pbyPixels(buffer.Lock())
+        : buffer_(buffer), m_uiStride(buffer.GetStride()), m_pbyPixels(buffer.Lock())
     {
         if constexpr (!std::is_const_v<TBuffer>)
             buffer.Touch();
@@ -110,7 +110,7 @@ public:
     ~CPixelAccess()
     {
         if (m_pbyPixels)
-            m_kBuffer.Unlock();
+            buffer_.Unlock();
     }
     CPixelAccess(const CPixelAccess&) = delete;
     CPixelAccess& operator=(const CPixelAccess&) = delete;
@@ -120,11 +120,11 @@ public:
     std::span<TByte> Bytes() const&& = delete; // such a lock is gone before a loop over them begins
     std::span<TByte> Bytes() const&
     {
-        return {m_pbyPixels, m_pbyPixels ? m_uiStride * static_cast<size_t>(m_kBuffer.GetHeight()) : 0};
+        return {m_pbyPixels, m_pbyPixels ? m_uiStride * static_cast<size_t>(buffer_.GetHeight()) : 0};
     }
 
 private:
-    TBuffer& m_kBuffer;
+    TBuffer& buffer_;
     size_t m_uiStride;
     TByte* m_pbyPixels;
 };

@@ -14,7 +14,7 @@
 namespace gw {
 namespace {
 
-constexpr CFactoryRow kClasses[] = {
+constexpr FactoryRow kClasses[] = {
     {&CMaterialBase::ms_kRTTI,     MakeNothing                  },
     {&CMaterial::ms_kRTTI,         MakeNothing                  },
     {&CStandardMaterial::ms_kRTTI, MakeObject<CStandardMaterial>},

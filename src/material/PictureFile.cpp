@@ -24,12 +24,12 @@ constexpr const char* kCodecModule = "gw_picture_codec.so";
 
 // The formats that pictures may have: names that a file holds must not choose among all that the picture
 // library knows, since some of those run commands.
-struct CExtensionRow
+struct ExtensionRow
 {
     const char* extension;
     const char* format;
 };
-constexpr CExtensionRow kExtensions[] = {
+constexpr ExtensionRow kExtensions[] = {
     {"bmp",  "BMP" },
     {"dib",  "BMP" },
     {"gif",  "GIF" },
@@ -50,12 +50,12 @@ constexpr CExtensionRow kExtensions[] = {
 };
 
 // What files of a format begin with, for pictures whose name does not tell what they are.
-struct CBeginningRow
+struct BeginningRow
 {
     std::string_view beginning;
     const char* format;
 };
-constexpr CBeginningRow kBeginnings[] = {
+constexpr BeginningRow kBeginnings[] = {
     {"BM"sv,           "BMP" },
     {"GIF8"sv,         "GIF" },
     {"\xff\xd8\xff"sv, "JPEG"},
@@ -69,11 +69,11 @@ constexpr CBeginningRow kBeginnings[] = {
 const char* FormatOfExtension(std::string_view extension)
 {
     const auto row = std::ranges::find_if(
-        kExtensions, [&](const CExtensionRow& known) { return EqualNoCase(known.extension, extension); });
+        kExtensions, [&](const ExtensionRow& known) { return EqualNoCase(known.extension, extension); });
     return row == std::end(kExtensions) ? nullptr : row->format;
 }
 
-std::string_view ExtensionOf(const CPathParts& parts)
+std::string_view ExtensionOf(const PathParts& parts)
 {
     return std::string_view(parts.extension).substr(parts.extension.empty() ? 0 : 1);
 }
@@ -81,7 +81,7 @@ std::string_view ExtensionOf(const CPathParts& parts)
 const char* FormatOf(const std::string& path, std::string_view file)
 {
     const auto row = std::ranges::find_if(
-        kBeginnings, [&](const CBeginningRow& known) { return file.starts_with(known.beginning); });
+        kBeginnings, [&](const BeginningRow& known) { return file.starts_with(known.beginning); });
     return row == std::end(kBeginnings) ? FormatOfExtension(ExtensionOf(SplitPath(path))) : row->format;
 }
 
@@ -93,7 +93,7 @@ CPictureCodec* OpenCodec()
 }
 
 // Counts a picture's pixels before they come; false if the scene's pictures would take too much.
-bool Reserve(CLinkedPictures& memory, const CPictureHead& head, bool everyFrame)
+bool Reserve(PictureMemory& memory, const PictureHead& head, bool everyFrame)
 {
     const uint64_t pixels = static_cast<uint64_t>(head.width) * static_cast<uint64_t>(head.height);
     const uint64_t bytes = 4 * pixels + (everyFrame ? kFrameObjectBytes : 0);
@@ -102,13 +102,13 @@ bool Reserve(CLinkedPictures& memory, const CPictureHead& head, bool everyFrame)
     return !memory.m_bFull;
 }
 
-bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame, CLinkedPictures* memory,
+bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame, PictureMemory* memory,
             const CFrameTaker& take)
 {
     CPictureCodec* codec = format ? LoadPictureCodec() : nullptr;
     std::optional<CPixelLock> lock;
     const uint64_t usedBefore = memory ? memory->m_uiBytesUsed : 0;
-    const auto place = [&](const CPictureHead& head) -> uint8_t* {
+    const auto place = [&](const PictureHead& head) -> uint8_t* {
         if (memory && !Reserve(*memory, head, everyFrame))
             return nullptr;
         lock.reset();
@@ -125,13 +125,13 @@ bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame
     return good;
 }
 
-bool DecodeOne(std::span<const std::byte> file, const char* format, CLinkedPictures* memory,
+bool DecodeOne(std::span<const std::byte> file, const char* format, PictureMemory* memory,
                CPixelBuffer& pixels)
 {
     if (!pixels.Free())
         return false;
     const bool good =
-        Decode(file, format, false, memory, [&](const CPictureHead&) -> CPixelBuffer& { return pixels; });
+        Decode(file, format, false, memory, [&](const PictureHead&) -> CPixelBuffer& { return pixels; });
     if (!good)
         pixels.Free();
     return good;
@@ -158,7 +158,7 @@ CPictureCodec* LoadPictureCodec()
     return codec;
 }
 
-bool ReadPicture(const std::string& path, CPixelBuffer& pixels, CLinkedPictures* memory)
+bool ReadPicture(const std::string& path, CPixelBuffer& pixels, PictureMemory* memory)
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
@@ -167,7 +167,7 @@ bool ReadPicture(const std::string& path, CPixelBuffer& pixels, CLinkedPictures*
     return isDecoded && file.IsWhole();
 }
 
-bool ReadFrames(const std::string& path, const CFrameTaker& take, CLinkedPictures* memory)
+bool ReadFrames(const std::string& path, const CFrameTaker& take, PictureMemory* memory)
 {
     CMappedFile file;
     const bool isThere = file.Open(path) == EFailure::None;
@@ -190,10 +190,10 @@ bool EncodePicture(const CPixelBuffer& pixels, std::string_view extension, int32
         return false;
     CPictureCodec* codec = LoadPictureCodec();
     const CPixelLayout& layout = pixels.Layout();
-    const CPictureHead head{.width = layout.m_iWidth,
-                            .height = layout.m_iHeight,
-                            .horizontalResolution = layout.m_iHorizontalResolution,
-                            .verticalResolution = layout.m_iVerticalResolution};
+    const PictureHead head{.width = layout.m_iWidth,
+                           .height = layout.m_iHeight,
+                           .horizontalResolution = layout.m_iHorizontalResolution,
+                           .verticalResolution = layout.m_iVerticalResolution};
     std::vector<uint8_t> packed;
     return codec && codec->Encode(head, DenseRows(pixels, view, packed), pixels.GetBytesPerPixel(), format,
                                   quality, file);

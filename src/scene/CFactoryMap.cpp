@@ -14,9 +14,9 @@ CObjectFactory CFactoryMap::Find(std::string_view className) const
     return entry == m_kFactory.end() ? nullptr : entry->second;
 }
 
-int RegisterClasses(std::span<const CFactoryRow> rows)
+int RegisterClasses(std::span<const FactoryRow> rows)
 {
-    for (const CFactoryRow& row : rows)
+    for (const FactoryRow& row : rows)
         CFactoryMap::Instance().Set(row.m_pkRecord->m_pcName, row.m_pkFactory);
     return static_cast<int>(rows.size());
 }

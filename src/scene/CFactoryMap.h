@@ -35,14 +35,14 @@ private:
 };
 
 /// One row of a room's class table.
-struct CFactoryRow
+struct FactoryRow
 {
     const CRTTI* m_pkRecord;
     CObjectFactory m_pkFactory;
 };
 
 /// Enters a table in the map. The answer is the number of rows, for the static that calls this.
-int RegisterClasses(std::span<const CFactoryRow> rows);
+int RegisterClasses(std::span<const FactoryRow> rows);
 
 /// The factory of every abstract class.
 CObject* MakeNothing(COrrinStream& stream);

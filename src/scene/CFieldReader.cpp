@@ -14,7 +14,7 @@ constexpr size_t kForgetBytes = size_t{16} << 20; // seldom enough to cost nothi
 
 void CFieldReader::Fail(EFailure reason)
 {
-    m_kRecord.Fail(reason, m_uiPosition, m_pcClassName);
+    record_.Fail(reason, m_uiPosition, m_pcClassName);
 }
 
 void CFieldReader::BeginObject(std::vector<uint32_t>& linkIDs, const char* className)

@@ -18,7 +18,7 @@ class CFieldReader : public CFieldArchive
 public:
     CFieldReader(std::span<const std::byte> bytes, size_t position, CVersion version, CFailureRecord& record)
         : CFieldArchive(true, version), m_kBytes(bytes), m_uiPosition(std::min(position, bytes.size())),
-          m_kRecord(record)
+          record_(record)
     {
     }
 
@@ -34,7 +34,7 @@ public:
 
     size_t Position() const { return m_uiPosition; }
     bool AtEnd() const { return m_uiPosition >= m_kBytes.size(); }
-    bool IsDamaged() const { return static_cast<bool>(m_kRecord.Failure()); }
+    bool IsDamaged() const { return static_cast<bool>(record_.Failure()); }
     /// The file that the bytes are mapped from. Its pages are given back as they are used up, so that a large
     /// block does not stand in memory twice.
     void SetSource(CMappedFile* file) { m_pkFile = file; }
@@ -52,7 +52,7 @@ private:
 
     std::span<const std::byte> m_kBytes;
     size_t m_uiPosition;
-    CFailureRecord& m_kRecord;
+    CFailureRecord& record_;
     std::vector<uint32_t>* m_pkLinkIDs = nullptr;
     const char* m_pcClassName = "";
     CMappedFile* m_pkFile = nullptr;

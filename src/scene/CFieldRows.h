@@ -9,7 +9,7 @@
 namespace gw {
 
 /// One stored field as a row of a table.
-struct CFieldRow
+struct FieldRow
 {
     std::string name;
     std::string cell;             ///< markup
@@ -23,7 +23,7 @@ class CFieldRows : public CFieldArchive
 public:
     CFieldRows() : CFieldArchive(false, kNewestVersion) {}
 
-    std::span<const CFieldRow> Rows() const { return m_kRows; }
+    std::span<const FieldRow> Rows() const { return m_kRows; }
 
     void Text(const char* name, CText& text) override;
     bool Presence(const char* name, bool present) override;
@@ -39,7 +39,7 @@ protected:
 private:
     void Show(const char* name, const std::string& text);
 
-    std::vector<CFieldRow> m_kRows;
+    std::vector<FieldRow> m_kRows;
     size_t m_uiArrays = 0;  // around the present place
     size_t m_uiRecords = 0; // so far, in the outermost array
     size_t m_uiCount = 0;   // the last one

@@ -9,7 +9,7 @@ constexpr size_t kGatherBytes = size_t{1} << 16;
 } // namespace
 
 CFieldWriter::CFieldWriter(CByteSink sink, std::function<uint32_t(const CObject*)> linkID)
-    : CFieldArchive(false, kNewestVersion), m_kSink(std::move(sink)), m_kLinkID(std::move(linkID))
+    : CFieldArchive(false, kNewestVersion), m_kSink(std::move(sink)), linkID_(std::move(linkID))
 {
     m_kGathered.reserve(kGatherBytes);
 }
@@ -67,7 +67,7 @@ void CFieldWriter::Values(const char*, EFieldKind kind, void* values, size_t cou
 
 void CFieldWriter::Slot(const char*, const CLinkSlot& slot)
 {
-    WriteUnsigned(m_kLinkID(slot.Get()));
+    WriteUnsigned(linkID_(slot.Get()));
 }
 
 } // namespace gw

@@ -35,7 +35,7 @@ protected:
 
 private:
     CByteSink m_kSink;
-    std::function<uint32_t(const CObject*)> m_kLinkID;
+    std::function<uint32_t(const CObject*)> linkID_;
     std::vector<std::byte> m_kGathered;
     bool m_bRefused = false;
 };

@@ -13,28 +13,28 @@ constexpr unsigned kBorder = 3;
 void CHTMLTables::Begin(const CRTTI& record)
 {
     End();
-    m_kPage.AddLine(HTMLEnclosed(EHTMLElement::Heading, record.m_pcName));
-    m_kPage.AddLine(HTMLRule());
-    m_kPage.AddLine(HTMLTable(EHTMLEnd::Opening, kBorder) + kHTMLMembers);
+    page_.AddLine(HTMLEnclosed(EHTMLElement::Heading, record.m_pcName));
+    page_.AddLine(HTMLRule());
+    page_.AddLine(HTMLTable(EHTMLEnd::Opening, kBorder) + kHTMLMembers);
     m_bOpen = true;
 }
 
 void CHTMLTables::End()
 {
     if (m_bOpen)
-        m_kPage.AddLine(HTMLTable(EHTMLEnd::Closing, kBorder));
+        page_.AddLine(HTMLTable(EHTMLEnd::Closing, kBorder));
     m_bOpen = false;
 }
 
 void CHTMLTables::Row(std::string_view label, std::string_view cell)
 {
-    m_kPage.AddLine(HTMLEnclosed(EHTMLElement::TableRow, HTMLEnclosed(EHTMLElement::HeaderCell, label) +
-                                                             HTMLEnclosed(EHTMLElement::DataCell, cell)));
+    page_.AddLine(HTMLEnclosed(EHTMLElement::TableRow, HTMLEnclosed(EHTMLElement::HeaderCell, label) +
+                                                           HTMLEnclosed(EHTMLElement::DataCell, cell)));
 }
 
-void CHTMLTables::AddRows(std::span<const CFieldRow> rows)
+void CHTMLTables::AddRows(std::span<const FieldRow> rows)
 {
-    for (const CFieldRow& row : rows)
+    for (const FieldRow& row : rows)
     {
         Row(row.name, row.cell);
         m_kLinked.insert(m_kLinked.end(), row.linked.begin(), row.linked.end());

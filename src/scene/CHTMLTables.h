@@ -16,7 +16,7 @@ namespace gw {
 class CHTMLTables
 {
 public:
-    explicit CHTMLTables(COrnHTMLPage& page) : m_kPage(page) {}
+    explicit CHTMLTables(COrnHTMLPage& page) : page_(page) {}
 
     /// The heading of a class and its table, closed by the next one or by End.
     void Begin(const CRTTI& record);
@@ -42,9 +42,9 @@ public:
     const std::vector<CObject*>& Linked() const { return m_kLinked; }
 
 private:
-    void AddRows(std::span<const CFieldRow> rows);
+    void AddRows(std::span<const FieldRow> rows);
 
-    COrnHTMLPage& m_kPage;
+    COrnHTMLPage& page_;
     std::vector<CObject*> m_kLinked;
     bool m_bOpen = false;
 };

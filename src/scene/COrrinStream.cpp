@@ -63,7 +63,7 @@ class CLinkResolver : public CFieldArchive
 {
 public:
     CLinkResolver(const COrrinStream& stream, CLinkRecord& record)
-        : CFieldArchive(stream.GetVersion()), m_kStream(stream), m_kRecord(record)
+        : CFieldArchive(stream.GetVersion()), stream_(stream), m_kRecord(record)
     {
     }
 
@@ -76,11 +76,11 @@ protected:
     void Slot(const char*, const CLinkSlot& slot) override
     {
         if (m_kRecord.m_uiCursor < m_kRecord.m_kLinkID.size())
-            slot.Set(m_kStream.FindLinkedObject(m_kRecord.m_kLinkID[m_kRecord.m_uiCursor++]));
+            slot.Set(stream_.FindLinkedObject(m_kRecord.m_kLinkID[m_kRecord.m_uiCursor++]));
     }
 
 private:
-    const COrrinStream& m_kStream;
+    const COrrinStream& stream_;
     CLinkRecord& m_kRecord;
 };
 

@@ -33,7 +33,7 @@ struct CLinkRecord
 };
 
 /// How much memory the linked pictures of one scene take, of how much they may.
-struct CLinkedPictures
+struct PictureMemory
 {
     /// Room for one picture of 64 megapixels, the largest that the codec reads, or for four of 4096 x 4096.
     /// Without a limit, a scene of a few KB could take 256 MiB for each picture file of 200 KB that it names.
@@ -117,7 +117,7 @@ public:
     /// A fresh record for an object that is about to read itself; the stream owns it.
     CLinkRecord& NewLinkRecord(CObject& object);
     /// The memory of the linked pictures that the load in progress has read.
-    CLinkedPictures& LinkedPictures() { return m_kLinkedPictures; }
+    PictureMemory& LinkedPictures() { return m_kLinkedPictures; }
     /// Keeps a warning about the load in progress.
     void Warn(EFailure reason, std::string name) { m_kRecord.Warn(reason, 0, std::move(name)); }
 
@@ -144,7 +144,7 @@ private:
     std::unordered_map<const CObject*, uint32_t> m_kSaveID;
     std::string m_kBaseDirectory;
     bool m_bHasBaseDirectory = false;
-    CLinkedPictures m_kLinkedPictures;  // of the load in progress or the last one
+    PictureMemory m_kLinkedPictures;    // of the load in progress or the last one
     CMappedFile* m_pkFile = nullptr;    // while reading one
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing

@@ -44,7 +44,7 @@ Ref<CRawData> MakeBlock(const char* name, std::span<const std::byte> bytes)
 }
 
 // A package whose motion has no bytes.
-std::vector<std::byte> EmptyPackage(const CPackageInfo& info)
+std::vector<std::byte> EmptyPackage(const PackageInfo& info)
 {
     const InfoBlock block{.m_uiFormat = info.format, .m_fThird = info.third, .m_fFourth = info.fourth};
     const Ref<CNode> node = new CNode(1);
@@ -91,7 +91,7 @@ bool CPackageFile::Keep(bool written)
     return m_eFailure == EFailure::None;
 }
 
-bool CPackageFile::Open(const std::string& path, const CPackageInfo& info)
+bool CPackageFile::Open(const std::string& path, const PackageInfo& info)
 {
     m_eFailure = EFailure::None;
     m_uiMotionBytes = 0;

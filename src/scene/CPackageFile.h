@@ -11,7 +11,7 @@
 namespace gw {
 
 /// What stands in the info block of a package.
-struct CPackageInfo
+struct PackageInfo
 {
     uint32_t format = 0; ///< of the motion file: FormatCode
     float third = 0.0f;
@@ -28,7 +28,7 @@ class CPackageFile
 {
 public:
     /// Starts writing beside a destination, with all that stands before the motion.
-    bool Open(const std::string& path, const CPackageInfo& info);
+    bool Open(const std::string& path, const PackageInfo& info);
     /// The next bytes of the motion. False where the file system does not take them or no container is that
     /// large; Commit will then fail too.
     bool Write(std::span<const std::byte> motion);

@@ -11,7 +11,7 @@
 namespace gw {
 namespace {
 
-constexpr CFactoryRow kClasses[] = {
+constexpr FactoryRow kClasses[] = {
     {&CObject::ms_kRTTI,              MakeNothing                     },
     {&CSpatial::ms_kRTTI,             MakeNothing                     },
     {&CNode::ms_kRTTI,                MakeObject<CNode>               },

@@ -51,7 +51,7 @@ protected:
             SelectProfile(profile);
         m_kWindow.m_kBoxes = {""};
         m_kWindow.m_kTitles = {"Gaitwright v2.0"};
-        m_kWindow.m_kFolderAnswer = CFolderChoice{m_kFolder.Path(folder), job};
+        m_kWindow.folderAnswer = FolderChoice{m_kFolder.Path(folder), job};
         m_kWindow.TakeCalls();
         return m_kContent.RunBatch();
     }
@@ -106,7 +106,7 @@ TEST_F(BatchTest, AMisfitAbandonsTheRunAndKeepsWhatIsDone)
 TEST_F(BatchTest, APackageThatCannotBeReadEndsTheRunWithoutAWord)
 {
     Write("run/a.htr", "text");
-    m_kWindow.m_kOnPaint = [this] { DeleteFile(m_kFolder.Path("run/a.htr")); };
+    m_kWindow.onPaint = [this] { DeleteFile(m_kFolder.Path("run/a.htr")); };
     EXPECT_EQ(Run("run/", 2, ""), 0);
     EXPECT_EQ(m_kWindow.TakeWords().find("not-found"), 0u);
     EXPECT_EQ(m_kWindow.m_kBoxes.back(), "");

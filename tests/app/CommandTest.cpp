@@ -140,7 +140,7 @@ TEST_F(ContentTest, AMissingViewIsReportedAndNothingElseStops)
     CBlindWindow window;
     CGaitConvertContent content(window, m_kPlatform);
     EXPECT_FALSE(content.OnInitContent());
-    window.m_kOpenAnswer = Write("walk.bvh", BvhText(kPoserBones));
+    window.openAnswer = Write("walk.bvh", BvhText(kPoserBones));
     EXPECT_EQ(content.OpenSource(), 1);
     EXPECT_EQ(content.ConvertMotion(), 1);
     for (const char* child : {"play", "stop", "end", "play1", "end1"})

@@ -47,7 +47,7 @@ TEST(FolderText, IsShownWithoutItsLastSeparator)
 std::vector<std::string> Told(std::string_view filter)
 {
     std::vector<std::string> told;
-    for (const CFileFilter& choice : SplitFilter(filter))
+    for (const FileFilter& choice : SplitFilter(filter))
     {
         told.push_back(choice.text);
         told.insert(told.end(), choice.patterns.begin(), choice.patterns.end());

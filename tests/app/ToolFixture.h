@@ -13,12 +13,12 @@ namespace gw {
 class CScriptedToolWindow : public CToolWindow
 {
 public:
-    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override { return Ask(setup); }
-    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override { return Ask(setup); }
-    bool EditLine(CMapLine& line) override
+    std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) override { return Ask(setup); }
+    std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override { return Ask(setup); }
+    bool EditLine(MapLine& line) override
     {
         m_kEdited = line;
-        return m_kOnEdit && (m_kOnEdit(line), true);
+        return onEdit && (onEdit(line), true);
     }
     std::unique_ptr<CMotionView> CreateView(EToolMotion motion) override
     {
@@ -30,17 +30,17 @@ public:
 
     CWatchedView& View(EToolMotion motion) { return *m_pkViews[static_cast<size_t>(motion)]; }
 
-    std::optional<std::string> m_kAnswer;
-    CFileDialogSetup m_kAsked;
-    std::function<void(CMapLine&)> m_kOnEdit; ///< what the user changes before OK; cancels without
-    CMapLine m_kEdited;
+    std::optional<std::string> answer;
+    FileDialogSetup m_kAsked;
+    std::function<void(MapLine&)> onEdit; ///< what the user changes before OK; cancels without
+    MapLine m_kEdited;
     bool m_bClosed = false;
 
 private:
-    std::optional<std::string> Ask(const CFileDialogSetup& setup)
+    std::optional<std::string> Ask(const FileDialogSetup& setup)
     {
         m_kAsked = setup;
-        return m_kAnswer;
+        return answer;
     }
 
     CWatchedView* m_pkViews[3] = {};
@@ -55,7 +55,7 @@ protected:
 
     void Click(int id, const std::string& file = {})
     {
-        m_kToolWindow.m_kAnswer = file.empty() ? std::nullopt : std::optional(m_kFolder.Path(file));
+        m_kToolWindow.answer = file.empty() ? std::nullopt : std::optional(m_kFolder.Path(file));
         m_kTool.ClickButton(id);
     }
     /// Loads a walk of some frames.
@@ -74,7 +74,7 @@ protected:
     std::string Lines() const
     {
         std::string text;
-        for (const CMapLine& line : m_kTool.Map().Lines())
+        for (const MapLine& line : m_kTool.Map().Lines())
             text += line.text + '|';
         return text;
     }

@@ -103,14 +103,14 @@ TEST_F(ToolTest, ASelectedMappingSelectsItsBones)
 
 TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
 {
-    const auto setNumbers = [](CMapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
-    const auto setRate = [](CMapLine& line) { line.frameRate = 25; };
-    const auto setText = [](CMapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
+    const auto setNumbers = [](MapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
+    const auto setRate = [](MapLine& line) { line.frameRate = 25; };
+    const auto setText = [](MapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
     const struct
     {
         const char* what;
         int line;
-        std::function<void(CMapLine&)> edit;
+        std::function<void(MapLine&)> edit;
         const char* text;
     } rows[] = {
         {"a text, cut",      0, setText,    "\u00c4 name of more than thirty-two c"},
@@ -125,11 +125,11 @@ TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
     {
         SCOPED_TRACE(row.what);
         m_kTool.SelectLine(row.line);
-        m_kToolWindow.m_kOnEdit = nullptr;
+        m_kToolWindow.onEdit = nullptr;
         const std::string before = m_kTool.Map().SelectedLine()->text;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().SelectedLine()->text, before) << "cancelled";
-        m_kToolWindow.m_kOnEdit = row.edit;
+        m_kToolWindow.onEdit = row.edit;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(row.line)].text, row.text);
         EXPECT_EQ(m_kTool.Map().Selected(), row.line);
@@ -196,7 +196,7 @@ TEST_F(ToolTest, BonesThatAreNotThereHaveNoEffect)
     for (const char* text : {"a <---> LThigh 1,2,3", "hip <---> b 1,2,3", "<---> "})
     {
         m_kTool.SelectLine(line++);
-        m_kToolWindow.m_kOnEdit = [&](CMapLine& edited) { edited.text = text; };
+        m_kToolWindow.onEdit = [&](MapLine& edited) { edited.text = text; };
         Click(kToolDetail);
     }
     EXPECT_EQ(Lines(), "Position 0,0,0|hip <---> LowerTorso .|a <---> LThigh 1,2,3|hip <---> b 1,2,3|<---> |"
@@ -234,7 +234,7 @@ TEST_F(ToolTest, HostileMaps)
         SCOPED_TRACE(row.what);
         Write("hostile.txt", row.bytes);
         Click(kToolLoadMap, "hostile.txt");
-        m_kToolWindow.m_kOnEdit = [](CMapLine&) {};
+        m_kToolWindow.onEdit = [](MapLine&) {};
         for (int line = 0; line < 5; ++line)
         {
             m_kTool.SelectLine(line);

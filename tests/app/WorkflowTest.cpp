@@ -78,7 +78,7 @@ TEST_F(ContentTest, DiscardQuestion)
         const std::string path = m_kFolder.Path("kept.Kinetra");
         DeleteFile(path);
         m_kWindow.m_kAnswers[139] = row.answer;
-        m_kWindow.m_kSaveAnswer = row.saves ? std::optional(path) : std::nullopt;
+        m_kWindow.saveAnswer = row.saves ? std::optional(path) : std::nullopt;
         EXPECT_EQ(Open(m_kFolder.Path("walk.bvh")), row.opened ? 1 : 0);
         EXPECT_EQ(m_kContent.IsConverted(), !row.opened);
         EXPECT_EQ(Exists("kept.Kinetra"), row.saved);
@@ -99,7 +99,7 @@ TEST_F(ContentTest, NothingIsAskedWhenNothingWouldBeLost)
 
 TEST_F(ContentTest, OpeningTellsTheFolderAndReadsItBack)
 {
-    m_kWindow.m_kOpenAnswer = std::nullopt;
+    m_kWindow.openAnswer = std::nullopt;
     EXPECT_EQ(m_kContent.OpenSource(), 1) << "a cancelled dialog is no failure";
     Open(Write("deep/walk.bvh", BvhText(kPoserBones)));
     m_kWindow.TakeCalls();
@@ -152,7 +152,7 @@ TEST_F(ContentTest, AContainerStaysTheSourceUntilABatchRuns)
     EXPECT_EQ(m_kContent.SourceRoot(), scene);
     EXPECT_EQ(m_kWindow.m_pkSource->m_spkShown.Get(), scene);
 
-    m_kWindow.m_kFolderAnswer = CFolderChoice{m_kFolder.Path("only/"), 1};
+    m_kWindow.folderAnswer = FolderChoice{m_kFolder.Path("only/"), 1};
     m_kContent.RunBatch();
     EXPECT_NE(m_kContent.SourceRoot(), scene);
 }

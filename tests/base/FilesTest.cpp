@@ -91,7 +91,7 @@ TEST(Paths, SplitIntoFolderStemAndExtension)
     for (const auto& row : rows)
     {
         SCOPED_TRACE(row.path);
-        const CPathParts parts = SplitPath(row.path);
+        const PathParts parts = SplitPath(row.path);
         EXPECT_EQ(parts.folder, row.folder);
         EXPECT_EQ(parts.stem, row.stem);
         EXPECT_EQ(parts.extension, row.extension);

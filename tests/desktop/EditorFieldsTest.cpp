@@ -52,7 +52,7 @@ TEST_F(EditorFields, EnterCommitsARateAndKeepsTheWindow)
 
 TEST_F(EditorFields, AMessageThatTakesTheFocusIsShownOnce)
 {
-    m_kWindow.m_kOnBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
+    m_kWindow.onBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
     Type(kNameField, "mine");
     Child<QLineEdit>(kFrameRateField).setFocus();
     EXPECT_THAT(TakeBoxes(), ElementsAre("box 158"));

@@ -15,9 +15,9 @@ void Settle()
 
 EditorTest::EditorTest()
 {
-    m_kWindow.m_kOnShowEditor = [this](bool shown) { m_kEditor.SetShown(shown); };
-    m_kWindow.m_kOnRefreshEditor = [this] { m_kEditor.Refresh(); };
-    m_kWindow.m_kOnBoneOffset = [this](CBoneOffsetDialog& dialog) { return m_kEditor.RunBoneOffset(dialog); };
+    m_kWindow.onShowEditor = [this](bool shown) { m_kEditor.SetShown(shown); };
+    m_kWindow.onRefreshEditor = [this] { m_kEditor.Refresh(); };
+    m_kWindow.onBoneOffset = [this](CBoneOffsetDialog& dialog) { return m_kEditor.RunBoneOffset(dialog); };
 }
 
 // What was queued finds everything as it was.

@@ -13,7 +13,7 @@ namespace {
 class CMirror
 {
 public:
-    explicit CMirror(const CMapRowModel& model) : m_kModel(model)
+    explicit CMirror(const CMapRowModel& model) : model_(model)
     {
         QObject::connect(&model, &QAbstractItemModel::rowsInserted, &model,
                          [this](const QModelIndex&, int first, int last) {
@@ -38,12 +38,12 @@ private:
         {
             std::string text;
             for (int column = 0; column < kMapColumnCount; ++column)
-                text += m_kModel.index(row, column).data().toString().toStdString() + '|';
+                text += model_.index(row, column).data().toString().toStdString() + '|';
             m_kRows[size_t(row)] = text;
         }
     }
 
-    const CMapRowModel& m_kModel;
+    const CMapRowModel& model_;
     std::vector<std::string> m_kRows;
 };
 
@@ -74,7 +74,7 @@ TEST(EditorRowModel, EveryChangeIsTold)
     {
         for (int change = below(4); change >= 0; --change)
         {
-            CRowNumbers numbers;
+            RowNumbers numbers;
             numbers.rotation[1] = below(3);
             if (below(3) == 0)
                 table.RemoveRow(below(20));

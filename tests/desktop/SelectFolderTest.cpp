@@ -35,7 +35,7 @@ protected:
     CSelectFolderDialog& Open(const std::string& filter = {}, const std::string& initial = {})
     {
         m_pkDialog = std::make_unique<CSelectFolderDialog>(
-            nullptr, CFileDialogSetup{{}, filter, initial.empty() ? m_kFolder.Path() : initial});
+            nullptr, FileDialogSetup{{}, filter, initial.empty() ? m_kFolder.Path() : initial});
         m_pkDialog->show();
         Activate(*m_pkDialog);
         return *m_pkDialog;

@@ -55,7 +55,7 @@ constexpr Vec3 kEnd{0.0f, 6.0f, 0.0f};
 class CWalkText
 {
 public:
-    explicit CWalkText(const WalkStyle& style) : m_kStyle(style)
+    explicit CWalkText(const WalkStyle& style) : style_(style)
     {
         if (style.rootBelow)
             m_kJoints.push_back({"Reference", -1, kVec3Zero, 0.0, 0.0});
@@ -74,19 +74,18 @@ public:
         for (size_t i = 0; i < m_kJoints.size(); ++i)
             AppendJoint(i);
         Line(0, "MOTION");
-        Line(0, "Frames: " + std::to_string(m_kStyle.frames));
-        Line(0, "Frame Time: " + Number(1.0 / m_kStyle.declaredRate));
-        for (int frame = 0; frame < m_kStyle.frames; ++frame)
-            AppendRow(frame / m_kStyle.rate);
+        Line(0, "Frames: " + std::to_string(style_.frames));
+        Line(0, "Frame Time: " + Number(1.0 / style_.declaredRate));
+        for (int frame = 0; frame < style_.frames; ++frame)
+            AppendRow(frame / style_.rate);
         return m_kText;
     }
 
 private:
-    int DepthOf(size_t joint) const { return m_kJoints[joint].depth + (m_kStyle.rootBelow ? 1 : 0); }
+    int DepthOf(size_t joint) const { return m_kJoints[joint].depth + (style_.rootBelow ? 1 : 0); }
     bool HasPositions(size_t joint) const
     {
-        return DepthOf(joint) <= (m_kStyle.rootBelow ? 1 : 0) || m_kStyle.sixChannels ||
-               m_kStyle.repeatsOffsets;
+        return DepthOf(joint) <= (style_.rootBelow ? 1 : 0) || style_.sixChannels || style_.repeatsOffsets;
     }
 
     void Line(int depth, const std::string& words)
@@ -96,12 +95,12 @@ private:
     std::string Number(double number) const
     {
         char text[40];
-        std::snprintf(text, sizeof(text), m_kStyle.scientific ? "%.7e" : "%.6f", number);
+        std::snprintf(text, sizeof(text), style_.scientific ? "%.7e" : "%.6f", number);
         return text;
     }
     std::string Numbers(const Vec3& v) const
     {
-        const Vec3 up = (m_kStyle.zUp ? Vec3{v.x, -v.z, v.y} : v) * m_kStyle.unit;
+        const Vec3 up = (style_.zUp ? Vec3{v.x, -v.z, v.y} : v) * style_.unit;
         return Number(up.x) + ' ' + Number(up.y) + ' ' + Number(up.z);
     }
 
@@ -141,9 +140,9 @@ private:
         for (size_t joint = 0; joint < m_kJoints.size(); ++joint)
         {
             const bool hip = m_kJoints[joint].name == std::string_view("Hips");
-            const Vec3 position = hip                       ? HipAt(seconds)
-                                  : m_kStyle.repeatsOffsets ? m_kJoints[joint].offset
-                                                            : kVec3Zero;
+            const Vec3 position = hip                     ? HipAt(seconds)
+                                  : style_.repeatsOffsets ? m_kJoints[joint].offset
+                                                          : kVec3Zero;
             if (HasPositions(joint))
                 row += Numbers(position) + ' ';
             const double turn =
@@ -154,7 +153,7 @@ private:
         Line(0, row);
     }
 
-    const WalkStyle& m_kStyle;
+    const WalkStyle& style_;
     std::vector<JointRow> m_kJoints;
     std::string m_kText;
 };

@@ -51,7 +51,7 @@ bool SaveSetting(const std::string&)
 
 bool SaveMap(const std::string& path)
 {
-    std::vector<CMapLine> lines;
+    std::vector<MapLine> lines;
     if (!ReadMapLines(path, lines))
         return false;
     lines.push_back(ParseMapLine(MappingLine("Skull", "Head")));

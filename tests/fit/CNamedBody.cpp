@@ -28,7 +28,7 @@ std::string OffsetText(float x, float y, float z)
 } // namespace
 
 CNamedBody::CNamedBody(const Convention& convention, const BodyChange& change)
-    : m_kConvention(convention), m_kChange(change)
+    : convention_(convention), m_kChange(change)
 {
     AddTrunk();
     const CTempFolder folder;
@@ -46,7 +46,7 @@ bool CNamedBody::MayDrive(const std::string& target, std::string_view joint) con
 std::string CNamedBody::NameFor(std::string name, float side) const
 {
     const bool isLeft = (side > 0.0f) != (m_kChange.names == BodyChange::SidesSwapped);
-    const std::string word = Words(m_kConvention.sides)[isLeft ? 0 : 1];
+    const std::string word = Words(convention_.sides)[isLeft ? 0 : 1];
     if (const size_t star = name.find_first_of("*+"); star != name.npos)
         name = name.substr(0, star) + (name[star] == '*' ? word : isLeft ? "L" : "R") + name.substr(star + 1);
     name = m_kChange.prefix + name;
@@ -64,7 +64,7 @@ int CNamedBody::Add(int parent, const std::string& name, std::string_view target
 
 void CNamedBody::AddTrunk()
 {
-    std::vector<std::string> trunk = Words(m_kConvention.trunk);
+    std::vector<std::string> trunk = Words(convention_.trunk);
     int top = Add(-1, NameFor(trunk[0], 0.0f), "LowerTorso", 0.0f, 95.0f, 0.0f);
     const float step = 30.0f / static_cast<float>(trunk.size() - 1);
     AddLeg(1.0f);
@@ -79,7 +79,7 @@ void CNamedBody::AddTrunk()
 
 void CNamedBody::AddHead(int chest)
 {
-    std::vector<std::string> names = Words(m_kConvention.head);
+    std::vector<std::string> names = Words(convention_.head);
     int top = chest;
     for (size_t i = 0; i + 1 < names.size(); ++i)
         top = Add(top, NameFor(names[i], 0.0f), "Neck", 0.0f, i == 0 ? 20.0f : 5.0f, 0.0f);
@@ -90,7 +90,7 @@ void CNamedBody::AddArm(int chest, float side)
 {
     constexpr const char* kBones[] = {"Collar", "UpperArm", "Forearm", "Hand"};
     constexpr float kOut[] = {4.0f, 14.0f, 28.0f, 26.0f};
-    std::vector<std::string> names = Words(m_kConvention.arm);
+    std::vector<std::string> names = Words(convention_.arm);
     if (m_kChange.names == BodyChange::ArmsExchanged)
         std::swap(names[0], names[1]);
     const bool shifted = m_kChange.names == BodyChange::ArmsShifted;
@@ -129,7 +129,7 @@ void CNamedBody::AddLeg(float side)
 {
     constexpr const char* kBones[] = {"", "Thigh", "Calf", "Foot", ""};
     constexpr float kDown[] = {0.0f, -4.0f, -42.0f, -42.0f, -7.0f};
-    const std::vector<std::string> names = Words(m_kConvention.leg);
+    const std::vector<std::string> names = Words(convention_.leg);
     const std::string letter = side > 0.0f ? "L" : "R";
     int joint = 0;
     for (size_t i = 0; i < names.size() - (m_kChange.toes ? 0 : 1); ++i)

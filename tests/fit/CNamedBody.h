@@ -75,7 +75,7 @@ private:
     void WriteJoint(std::string& text, size_t joint) const;
     std::string Text() const;
 
-    const Convention& m_kConvention;
+    const Convention& convention_;
     BodyChange m_kChange;
     std::vector<Joint> m_kJoints;
     std::map<std::string, std::string> m_kTargets; ///< the targets that a joint may drive, in words

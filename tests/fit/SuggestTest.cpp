@@ -197,7 +197,7 @@ TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
         const Mat3 rotation = Mat3FromAxisAngle(kVec3UnitX, angle(random)) *
                               Mat3FromAxisAngle(kVec3UnitY, angle(random)) *
                               Mat3FromAxisAngle(kVec3UnitZ, angle(random));
-        const CRowNumbers numbers = NearestOffset(rotation, kVec3UnitY);
+        const RowNumbers numbers = NearestOffset(rotation, kVec3UnitY);
         const Mat3 offset = OffsetOf(numbers);
         EXPECT_GT(Vec3Dot(offset.Row(1), rotation.Row(1)), std::cos(0.75f * kDegreesToRadians));
         EXPECT_GT(Vec3Dot(offset.Row(0), rotation.Row(0)), std::cos(2.5f * kDegreesToRadians));

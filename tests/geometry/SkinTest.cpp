@@ -137,7 +137,7 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
     for (const auto& row : skin.Groups())
     {
         groups.emplace_back();
-        for (const CSkinPointRun& run : row)
+        for (const SkinPointRun& run : row)
         {
             for (uint32_t point = run.begin; point < run.end; ++point)
                 groups.back().push_back(point);

@@ -62,10 +62,10 @@ std::vector<uint32_t> Colors(size_t count)
     return colors;
 }
 
-std::string Text(const std::vector<CPixelRGBA>& pixels)
+std::string Text(const std::vector<PixelRGBA>& pixels)
 {
     std::string text;
-    for (const CPixelRGBA& pixel : pixels)
+    for (const PixelRGBA& pixel : pixels)
     {
         char word[16];
         std::snprintf(word, sizeof word, "%s%02x%02x%02x.%02x", text.empty() ? "" : " ", pixel.r, pixel.g,
@@ -78,7 +78,7 @@ std::string Text(const std::vector<CPixelRGBA>& pixels)
 // One row of a picture as text, "none" where it cannot be read.
 std::string RowText(CPicture& picture, int y)
 {
-    std::vector<CPixelRGBA> pixels(static_cast<size_t>(picture.Box().width));
+    std::vector<PixelRGBA> pixels(static_cast<size_t>(picture.Box().width));
     return picture.ReadRowRGBA(y, 0, picture.Box().width, pixels.data()) ? Text(pixels) : "none";
 }
 
@@ -144,7 +144,7 @@ TEST_F(DriverTest, BMPReadsEveryDepth)
         std::string found(single.size(), '\0');
         ASSERT_TRUE(picture->ReadRow(0, 0, width, reinterpret_cast<uint8_t*>(found.data())));
         EXPECT_EQ(found, single);
-        CPixelRGBA last{};
+        PixelRGBA last{};
         ASSERT_TRUE(picture->ReadRowRGBA(0, width - 1, 1, &last));
         EXPECT_TRUE(pixels.ends_with(Text({last})));
     };
@@ -214,7 +214,7 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
         std::string found;
         for (const char y : row.order)
         {
-            CPixelRGBA pixel{};
+            PixelRGBA pixel{};
             picture->ReadRowRGBA(y - '0', 0, 1, &pixel);
             found += static_cast<char>('0' + pixel.g);
         }
@@ -304,7 +304,7 @@ TEST_F(DriverTest, BMPIsWrittenTopDown)
 {
     auto picture = OpenPicture(Path(), "w");
     ASSERT_TRUE(picture);
-    const CPixelRGBA pixels[] = {
+    const PixelRGBA pixels[] = {
         {1, 2, 3, 4},
         {5, 6, 7, 8}
     };
@@ -331,7 +331,7 @@ TEST_F(DriverTest, BMPOfOneChannelComesBackInGrey)
     EXPECT_FALSE(picture->SetChannelCount(2));
     ASSERT_TRUE(picture->SetChannelCount(1));
     ASSERT_TRUE(picture->SetSize({0, 0, 3, 1}));
-    const CPixelRGBA pixels[] = {
+    const PixelRGBA pixels[] = {
         {0,   0,   0,   9},
         {255, 255, 255, 0},
         {100, 100, 100, 0}
@@ -368,14 +368,14 @@ TEST_F(DriverTest, SinglePixelsAreNotSupported)
     bmp->writePixel(picture, 0, 0, 1);
     bmp->writePixelRGBA(picture, 0, 0, {});
     EXPECT_EQ(bmp->readPixel(picture, 0, 0), 0);
-    EXPECT_EQ(bmp->readPixelRGBA(picture, 0, 0), CPixelRGBA{});
+    EXPECT_EQ(bmp->readPixelRGBA(picture, 0, 0), PixelRGBA{});
     EXPECT_EQ(testing::internal::GetCapturedStderr(),
               "?picbmp_write_pixel\n?picbmp_write_pixel_rgba\n?picbmp_read_pixel\n?picbmp_read_pixel_rgba\n");
     EXPECT_EQ(bmp->getName(picture), Path());
     EXPECT_FALSE(bmp->nextPicture(picture));
-    CPixelRGBA pixel{};
+    PixelRGBA pixel{};
     EXPECT_TRUE(bmp->readRowRGBA(picture, 0, 0, 1, &pixel));
-    EXPECT_EQ(pixel, (CPixelRGBA{'3', '2', '1', 255}));
+    EXPECT_EQ(pixel, (PixelRGBA{'3', '2', '1', 255}));
     EXPECT_TRUE(bmp->close(picture));
 }
 

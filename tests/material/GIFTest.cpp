@@ -128,7 +128,7 @@ Pixels Random(size_t count, unsigned bits)
 }
 
 // The first image of a file in memory, with a block of its own, so that nothing behind it can be read unseen.
-bool ReadFirst(const std::string& file, CGIFImage& image)
+bool ReadFirst(const std::string& file, GIFImage& image)
 {
     const std::vector<char> bytes(file.begin(), file.end());
     CPicInput input(std::as_bytes(std::span(bytes)));
@@ -136,7 +136,7 @@ bool ReadFirst(const std::string& file, CGIFImage& image)
     return reader.ReadHeader() && reader.ReadImage(image);
 }
 
-size_t PixelCount(const CGIFImage& image)
+size_t PixelCount(const GIFImage& image)
 {
     return static_cast<size_t>(image.box.width) * static_cast<size_t>(image.box.height);
 }
@@ -150,7 +150,7 @@ const std::string
 
 TEST(CGIFReader, ReadsAKnownFile)
 {
-    CGIFImage image;
+    GIFImage image;
     ASSERT_TRUE(ReadFirst(kKnown, image));
     const char* const rows[] = {"1111122222", "1111122222", "1111122222", "1110000222", "1110000222",
                                 "2220000111", "2220000111", "2222211111", "2222211111", "2222211111"};
@@ -161,8 +161,8 @@ TEST(CGIFReader, ReadsAKnownFile)
     for (const uint8_t pixel : image.pixels)
         found += static_cast<char>('0' + pixel);
     EXPECT_EQ(found, expected);
-    EXPECT_EQ(image.palette[1], (CPixelRGBA{255, 0, 0, 255}));
-    EXPECT_EQ(image.palette[2], (CPixelRGBA{0, 0, 255, 255}));
+    EXPECT_EQ(image.palette[1], (PixelRGBA{255, 0, 0, 255}));
+    EXPECT_EQ(image.palette[2], (PixelRGBA{0, 0, 255, 255}));
 }
 
 TEST(CGIFReader, ReadsCodesOfEverySize)
@@ -176,7 +176,7 @@ TEST(CGIFReader, ReadsCodesOfEverySize)
                 SCOPED_TRACE(std::to_string(bits) + " bits, " + std::to_string(pixels.size()));
                 const unsigned width = pixels.size() == 1 ? 1 : 700;
                 const auto height = static_cast<unsigned>(pixels.size()) / width;
-                CGIFImage image;
+                GIFImage image;
                 ASSERT_TRUE(ReadFirst(Head(width, height, bits) +
                                           Image(width, height, 0, bits, Encoded(pixels, bits, full)),
                                       image));
@@ -200,7 +200,7 @@ TEST(CGIFReader, PutsInterlacedRowsInOrder)
             for (unsigned y = first; y < height; y += step)
                 stored.insert(stored.end(), 2, static_cast<uint8_t>(y));
         }
-        CGIFImage image;
+        GIFImage image;
         ASSERT_TRUE(ReadFirst(Head(2, height, 8) + Image(2, height, 0x40, 8, Encoded(stored, 8, EFull::Keep)),
                               image));
         for (unsigned y = 0; y < height; ++y)
@@ -222,18 +222,18 @@ TEST(CGIFReader, WalksTheBlocksToEachImage)
     ASSERT_TRUE(reader.ReadHeader());
     EXPECT_EQ(reader.ScreenWidth(), 9);
 
-    CGIFImage image;
+    GIFImage image;
     ASSERT_TRUE(reader.ReadImage(image));
     EXPECT_EQ(image.delay, 0x1234);
     EXPECT_EQ(image.disposal, 2);
-    EXPECT_EQ(image.palette[3], (CPixelRGBA{3, 6, 252, 0})) << "transparent";
-    EXPECT_EQ(image.palette[255], (CPixelRGBA{255, 254, 0, 255}));
+    EXPECT_EQ(image.palette[3], (PixelRGBA{3, 6, 252, 0})) << "transparent";
+    EXPECT_EQ(image.palette[255], (PixelRGBA{255, 254, 0, 255}));
     ASSERT_TRUE(reader.ReadImage(image));
     EXPECT_EQ(image.delay, 0) << "a control extension is for one image";
     EXPECT_EQ(image.box.x, 5);
     EXPECT_EQ(image.box.y, 6);
-    EXPECT_EQ(image.palette[3], (CPixelRGBA{3, 6, 252, 255}));
-    EXPECT_EQ(image.palette[255], (CPixelRGBA{0, 0, 0, 255})) << "a table of its own, of four";
+    EXPECT_EQ(image.palette[3], (PixelRGBA{3, 6, 252, 255}));
+    EXPECT_EQ(image.palette[255], (PixelRGBA{0, 0, 0, 255})) << "a table of its own, of four";
     EXPECT_FALSE(reader.ReadImage(image)) << "the trailer";
 }
 
@@ -242,7 +242,7 @@ TEST(CGIFReader, RefusesDamage)
     const std::string head = Head(2, 1, 2);
     const std::string codes = Encoded({3, 2}, 2, EFull::Keep);
     const auto reads = [](const std::string& file) {
-        CGIFImage image;
+        GIFImage image;
         return ReadFirst(file, image);
     };
     const std::string image = Image(2, 1, 0, 2, codes);
@@ -269,7 +269,7 @@ TEST(CGIFReader, SurvivesEveryBeginningAndEveryByte)
 {
     for (size_t end = 0; end < kKnown.size(); ++end)
     {
-        CGIFImage image;
+        GIFImage image;
         EXPECT_EQ(ReadFirst(kKnown.substr(0, end), image), end + 2 >= kKnown.size()) << end;
     }
     const std::string large =
@@ -282,7 +282,7 @@ TEST(CGIFReader, SurvivesEveryBeginningAndEveryByte)
             {
                 std::string bad = good;
                 bad[at] = static_cast<char>(bad[at] ^ change);
-                CGIFImage image;
+                GIFImage image;
                 const bool read = ReadFirst(bad, image);
                 EXPECT_TRUE(!read || image.pixels.size() == PixelCount(image)) << at;
             }
@@ -303,9 +303,9 @@ TEST(CGIFPicture, IsADriverThatOnlyReads)
     uint8_t indices[3];
     ASSERT_TRUE(gif->readRow(picture, 3, 2, 3, indices));
     EXPECT_EQ(indices[0] * 100 + indices[1] * 10 + indices[2], 100);
-    CPixelRGBA pixels[2];
+    PixelRGBA pixels[2];
     ASSERT_TRUE(gif->readRowRGBA(picture, 9, 8, 2, pixels));
-    EXPECT_EQ(pixels[1], (CPixelRGBA{255, 0, 0, 255}));
+    EXPECT_EQ(pixels[1], (PixelRGBA{255, 0, 0, 255}));
     EXPECT_FALSE(gif->readRow(picture, 10, 0, 1, indices));
     EXPECT_FALSE(gif->readRowRGBA(picture, 0, 9, 2, pixels));
     EXPECT_FALSE(gif->writeRow(picture, 0, 0, 1, indices));

@@ -249,7 +249,7 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
     };
     for (size_t i = 0; i < 2; ++i)
     {
-        const CFilmFrame& frame = film->GetFrame(i);
+        const FilmFrame& frame = film->GetFrame(i);
         EXPECT_EQ(frame.m_iLeft, rows[i].left);
         EXPECT_EQ(frame.m_uiDelay, rows[i].delay);
         EXPECT_EQ(frame.m_spkImage->Pixels().GetWidth(), rows[i].size);

@@ -435,7 +435,7 @@ TEST_F(CRetargeterTest, ShareFileLines)
         const char* what;
         const char* line;
         const char* bone; // null where none gets shares
-        CBoneShares shares;
+        BoneShares shares;
     } rows[] = {
         {"plain",                                    "Waist Share 1 2 Type 0",             "Waist",      {1, 2, 0}},
         {"keywords without case, commas and colons", "SHARE: 3, 4, tYPE: 2, Neck",         "Neck",       {3, 4, 2}},
@@ -455,7 +455,7 @@ TEST_F(CRetargeterTest, ShareFileLines)
         CRetargeter retargeter;
         retargeter.SetScenes(m_kSource.Get(), m_kTarget.Get());
         ASSERT_TRUE(retargeter.LoadShares(path));
-        const CBoneShares* shares = nullptr;
+        const BoneShares* shares = nullptr;
         ASSERT_EQ(retargeter.Shares(Target(row.bone ? row.bone : "Neck"), shares), row.bone != nullptr);
         if (!row.bone)
             continue;

@@ -25,7 +25,7 @@ TEST(BoneOffsetDialog, RotationLimitsAreUneven)
     };
     for (const auto& row : rows)
     {
-        CRowNumbers numbers;
+        RowNumbers numbers;
         numbers.rotation = {7, 7, 7};
         CBoneOffsetDialog dialog(numbers);
         dialog.LeaveRotation(row.axis, row.text);
@@ -52,7 +52,7 @@ TEST(BoneOffsetDialog, ChosenAxisIsSwappedOutOfTheOtherBoxes)
     };
     for (const auto& row : rows)
     {
-        CRowNumbers numbers;
+        RowNumbers numbers;
         numbers.axes = row.before;
         CBoneOffsetDialog dialog(numbers);
         const auto& entries = CBoneOffsetDialog::kAxisEntries;

@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-std::string Describe(const CMapLine& line)
+std::string Describe(const MapLine& line)
 {
     const std::string three = PositionLine(line.numbers).substr(9);
     switch (line.kind)
@@ -54,7 +54,7 @@ TEST(MapLines, LinesSayWhatTheirKeySays)
     };
     for (const auto& row : rows)
     {
-        const CMapLine line = ParseMapLine(row.text);
+        const MapLine line = ParseMapLine(row.text);
         EXPECT_EQ(line.text, row.text);
         EXPECT_EQ(Describe(line), row.says) << row.what;
     }
@@ -66,7 +66,7 @@ TEST(MapLines, FileHoldsTheLinesAsTheyStand)
     const std::string path = folder.Path("map.txt");
     const std::string written =
         "Unknown Source\nPosition 1,-2,0\nFrameRate 60\nA <---> Head .\nB <---> Waist 1,-2,3\n";
-    std::vector<CMapLine> lines;
+    std::vector<MapLine> lines;
     for (const std::string& text :
          {std::string("Unknown Source"), PositionLine({1.9f, -2.9f, 0}), FrameRateLine(60),
           MappingLine("A", "Head"), MappingLine("B", "Waist", {1, -2, 3})})

@@ -13,7 +13,7 @@ using testing::ElementsAre;
 
 namespace {
 
-std::string Describe(const CMissingBone& bone)
+std::string Describe(const MissingBone& bone)
 {
     const char* side = bone.side == ESkeletonSide::Source ? " source " : " target ";
     return std::to_string(bone.line) + side + bone.name + ' ' + bone.nearest;
@@ -140,7 +140,7 @@ TEST(ProfileFit, NamesTheSideTheLineAndTheNearestBone)
     CProfileFit fit;
     ASSERT_TRUE(MeasureFit(path, source.Get(), target.Get(), fit));
     std::vector<std::string> missing;
-    for (const CMissingBone& bone : fit.missing)
+    for (const MissingBone& bone : fit.missing)
         missing.push_back(Describe(bone));
     EXPECT_THAT(missing, ElementsAre("3 source Hip Hips", "6 target Rthig RThigh", "7 source qqqqqqqq ",
                                      "7 target Unknown ", "0 target RPelvis LPelvis"));

@@ -233,7 +233,7 @@ TEST_F(ProfileEditor, RemovedRowsFreeTheirBones)
 TEST_F(ProfileEditor, BoneOffsetChangesTheSelectedRow)
 {
     Load("N\nA x Waist 1,2,3\nB x Head 4,5,6,-1,3,2\n");
-    m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog& dialog) {
+    m_kOwner.boneOffset = [](CBoneOffsetDialog& dialog) {
         dialog.LeaveRotation(0, "70");
         dialog.ChooseAxis(0, 5);
         return true;
@@ -253,10 +253,10 @@ TEST_F(ProfileEditor, BoneOffsetWithoutAChangeLeavesTheRow)
     Load("N\nA x Waist 1,2,3\n");
     EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "nothing is selected";
     m_kEditor.SelectOnlyRow(0);
-    m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog&) { return true; };
+    m_kOwner.boneOffset = [](CBoneOffsetDialog&) { return true; };
     EXPECT_TRUE(m_kEditor.EditBoneOffset());
     EXPECT_FALSE(m_kEditor.IsDirty()) << "equal numbers are no change";
-    m_kOwner.m_kBoneOffset = nullptr;
+    m_kOwner.boneOffset = nullptr;
     EXPECT_FALSE(m_kEditor.EditBoneOffset()) << "cancelled";
 }
 

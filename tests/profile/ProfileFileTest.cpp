@@ -11,7 +11,7 @@ namespace gw {
 namespace {
 
 // A line as "12 source>target 1,2,3 4,5,6", "12 rate 30" or "12 at 1,2,3", with its number in the file.
-std::string Describe(const CProfileLine& line)
+std::string Describe(const ProfileLine& line)
 {
     const auto three = [](auto a, auto b, auto c) {
         return std::to_string(int(a)) + ',' + std::to_string(int(b)) + ',' + std::to_string(int(c));
@@ -31,7 +31,7 @@ std::string ReadAll(std::string_view text)
 {
     CProfileReader reader(text);
     std::string lines;
-    CProfileLine line;
+    ProfileLine line;
     while (reader.Next(line))
         lines += Describe(line) + "; ";
     return lines;

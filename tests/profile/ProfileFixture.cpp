@@ -28,7 +28,7 @@ std::string CScriptedOwner::FindProfilePath(const std::string& name)
 
 bool CScriptedOwner::RunBoneOffset(CBoneOffsetDialog& dialog)
 {
-    return m_kBoneOffset && m_kBoneOffset(dialog);
+    return boneOffset && boneOffset(dialog);
 }
 
 Ref<CNode> MakeChain(const std::vector<std::string>& names)

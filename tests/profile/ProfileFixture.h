@@ -30,7 +30,7 @@ public:
 
     CTempFolder m_kFolder;
     EAnswer m_eAnswer = EAnswer::OK;
-    std::function<bool(CBoneOffsetDialog&)> m_kBoneOffset; ///< what the user does in the offset dialog
+    std::function<bool(CBoneOffsetDialog&)> boneOffset; ///< what the user does in the offset dialog
     int m_iStateChanges = 0;
     int m_iSetChanges = 0;
 

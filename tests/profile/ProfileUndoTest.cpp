@@ -62,7 +62,7 @@ protected:
 
 TEST_F(ProfileUndo, EveryCommandIsTakenBackAndRepeated)
 {
-    m_kOwner.m_kBoneOffset = [](CBoneOffsetDialog& dialog) {
+    m_kOwner.boneOffset = [](CBoneOffsetDialog& dialog) {
         dialog.ChooseAxis(0, 5);
         return true;
     };

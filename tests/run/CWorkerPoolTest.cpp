@@ -14,7 +14,7 @@ namespace gw {
 
 namespace {
 
-using EKind = CJobEnd::EKind;
+using EKind = JobEnd::EKind;
 
 enum class EDeed
 {
@@ -31,7 +31,7 @@ class CDeeds : public CJobHandler
 {
 public:
     CDeeds(std::vector<EDeed> deeds, const CTempFolder& folder, bool goesOn = true)
-        : m_kDeeds(std::move(deeds)), m_kFolder(folder), m_bGoesOn(goesOn)
+        : m_kDeeds(std::move(deeds)), folder_(folder), m_bGoesOn(goesOn)
     {
     }
 
@@ -46,13 +46,13 @@ public:
         Do(m_kDeeds[job]);
         CSafeFile file;
         const bool written =
-            file.Open(m_kFolder.Path(std::to_string(job))) && file.Write("result") && file.Commit();
+            file.Open(folder_.Path(std::to_string(job))) && file.Write("result") && file.Commit();
         return written && m_kDeeds[job] != EDeed::Bad ? 1 : 0;
     }
 
     void Lost(size_t job) override { lost.push_back(job); }
 
-    bool Take(size_t job, const CJobEnd& end) override
+    bool Take(size_t job, const JobEnd& end) override
     {
         EXPECT_EQ(end.output, "output " + std::to_string(job) + '\n');
         EXPECT_EQ(end.words, "words " + std::to_string(job) + '\n');
@@ -83,7 +83,7 @@ private:
     }
 
     std::vector<EDeed> m_kDeeds;
-    const CTempFolder& m_kFolder;
+    const CTempFolder& folder_;
     bool m_bGoesOn;
 };
 

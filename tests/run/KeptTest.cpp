@@ -143,7 +143,7 @@ TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
     const struct
     {
         const char* what;
-        CProgress progress;
+        RunProgress progress;
         size_t width;
         const char* line;
     } rows[] = {

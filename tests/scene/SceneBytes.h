@@ -108,7 +108,7 @@ class CFieldDescriber : public CFieldArchive
 {
 public:
     explicit CFieldDescriber(const std::vector<CObject*>& objects)
-        : CFieldArchive(false, kNewestVersion), m_kObjects(objects)
+        : CFieldArchive(false, kNewestVersion), objects_(objects)
     {
     }
 
@@ -136,14 +136,14 @@ protected:
     }
     void Slot(const char* name, const CLinkSlot& slot) override
     {
-        const auto place = std::ranges::find(m_kObjects, slot.Get());
-        Line(name) << "-> " << (place == m_kObjects.end() ? 0 : place - m_kObjects.begin() + 1) << '\n';
+        const auto place = std::ranges::find(objects_, slot.Get());
+        Line(name) << "-> " << (place == objects_.end() ? 0 : place - objects_.begin() + 1) << '\n';
     }
 
 private:
     std::ostream& Line(const char* name) { return m_kText << "  " << name << ": "; }
 
-    const std::vector<CObject*>& m_kObjects;
+    const std::vector<CObject*>& objects_;
     std::ostringstream m_kText;
 };
 

@@ -25,11 +25,11 @@ struct NeedWords
 };
 
 constexpr NeedWords kNeeds[] = {
-    {EAlignNeed::RestPose,         "rest-pose",      "bone off its axis at rest",      "bones off their axes at rest"},
-    {EAlignNeed::UpAxis,           "up-axis",        "up axis that is not Y",          "up axes that are not Y"         },
+    {EAlignNeed::RestPose,         "rest-pose",      "bone off its axis at rest",       "bones off their axes at rest"},
+    {EAlignNeed::UpAxis,           "up-axis",        "up axis that is not Y",           "up axes that are not Y"      },
     {EAlignNeed::BoneFrames,       "bone-frame",     "rotated frame of a slanted bone",
-     "rotated frames of slanted bones"                                                                                  },
-    {EAlignNeed::DoubledPositions, "doubled-offset", "doubled bone",                   "doubled bones"                  },
+     "rotated frames of slanted bones"                                                                                },
+    {EAlignNeed::DoubledPositions, "doubled-offset", "doubled bone",                    "doubled bones"               },
 };
 
 const char* CodeOf(EAlignNeed need)
@@ -52,7 +52,8 @@ std::string MendedText(const AlignReport& report)
     return text.empty() ? "nothing to align" : text;
 }
 
-void WriteJson(const COptions& options, const CShellReports& reports, const AlignReport& report, bool written)
+void WriteJson(const ShellOptions& options, const CShellReports& reports, const AlignReport& report,
+               bool written)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -77,7 +78,7 @@ void WriteJson(const COptions& options, const CShellReports& reports, const Alig
 
 } // namespace
 
-EExit RunAlign(const COptions& options)
+EExit RunAlign(const ShellOptions& options)
 {
     if (!HasExtension(options.output, ".bvh"))
     {

@@ -20,14 +20,14 @@ namespace {
 
 // The desktop program takes the profile that is selected. Without --profile it is the one that `convert`
 // would take for the first file.
-bool SelectProfile(const COptions& options, CShellConversion& conversion, const std::string& first)
+bool SelectProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first)
 {
     if (options.job != "htr")
         return true;
     return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
 }
 
-void WriteJson(const COptions& options, const std::vector<CReport>& reports, size_t finished)
+void WriteJson(const ShellOptions& options, const std::vector<CReport>& reports, size_t finished)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -40,7 +40,7 @@ void WriteJson(const COptions& options, const std::vector<CReport>& reports, siz
 }
 
 // The file that ended the run is none of those that were finished.
-size_t FinishedCount(const COptions& options, const CBatchRun& run, bool failed)
+size_t FinishedCount(const ShellOptions& options, const CBatchRun& run, bool failed)
 {
     const size_t taken = run.TakenCount();
     if (options.keepGoing)
@@ -48,7 +48,7 @@ size_t FinishedCount(const COptions& options, const CBatchRun& run, bool failed)
     return failed && taken > 0 ? taken - 1 : taken;
 }
 
-EExit RunBatchJobs(const COptions& options, const CFileRun::Jobs& jobs)
+EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
 {
     CShellReports ownReports(options);
     CShellConversion conversion(options, {}, ownReports);
@@ -65,11 +65,11 @@ EExit RunBatchJobs(const COptions& options, const CFileRun::Jobs& jobs)
 
 // The folder alone and results beside their sources, as in the desktop program; with an output folder all
 // that lies below as well.
-bool ListJobs(const COptions& options, CFileRun::Jobs& jobs)
+bool ListJobs(const ShellOptions& options, CFileRun::Jobs& jobs)
 {
     const EBatchJob job = BatchJobOf(options);
     const std::string_view extensions[] = {BatchSource(job)};
-    std::vector<CSource> sources;
+    std::vector<RunSource> sources;
     if (options.outputFolder.empty() && options.filesFrom.empty())
     {
         for (const std::string& name : FilesInFolder(options.files[0], extensions[0]))
@@ -79,7 +79,7 @@ bool ListJobs(const COptions& options, CFileRun::Jobs& jobs)
     {
         return false;
     }
-    for (const CSource& source : sources)
+    for (const RunSource& source : sources)
         jobs.push_back({source.path, OutputOf(options.outputFolder, source, BatchResult(job))});
     return true;
 }
@@ -92,7 +92,7 @@ EExit FailWith(const std::string& words)
 
 } // namespace
 
-EExit RunBatchFolder(const COptions& options)
+EExit RunBatchFolder(const ShellOptions& options)
 {
     if (!options.files.empty() && !FolderExists(options.files[0]))
         return FailWith(Printable(options.files[0]) + ": no such folder");

@@ -21,7 +21,7 @@ namespace gw {
 namespace {
 
 // The result of a conversion, out of its package where it lies in one.
-bool LoadResult(const COptions& options, const std::string& path, CMotionFile& motion)
+bool LoadResult(const ShellOptions& options, const std::string& path, CMotionFile& motion)
 {
     if (HasExtension(path, ".Kinetra"))
         return LoadPackagedMotion(path, motion);
@@ -36,20 +36,20 @@ bool LoadResult(const COptions& options, const std::string& path, CMotionFile& m
 class CComparedSource
 {
 public:
-    explicit CComparedSource(const COptions& options)
-        : m_kOptions(options), m_kReports(options), m_kConversion(options, {true, false}, m_kReports)
+    explicit CComparedSource(const ShellOptions& options)
+        : options_(options), m_kReports(options), m_kConversion(options, {true, false}, m_kReports)
     {
     }
 
-    std::string FindProfile() { return m_kConversion.ResolveProfile(m_kOptions.profile); }
-    bool Load() { return m_kOptions.align ? Align() : LoadFile(); }
+    std::string FindProfile() { return m_kConversion.ResolveProfile(options_.profile); }
+    bool Load() { return options_.align ? Align() : LoadFile(); }
     MotionClip Clip();
 
 private:
     bool Align();
     bool LoadFile();
 
-    const COptions& m_kOptions;
+    const ShellOptions& options_;
     CShellReports m_kReports;
     CShellConversion m_kConversion;
     CSceneFile m_kFile;
@@ -57,26 +57,26 @@ private:
 
 bool CComparedSource::Align()
 {
-    return m_kConversion.Open(m_kOptions.files[0]) && m_kConversion.SelectProfile() &&
+    return m_kConversion.Open(options_.files[0]) && m_kConversion.SelectProfile() &&
            m_kConversion.Convert(true);
 }
 
 bool CComparedSource::LoadFile()
 {
-    if (!m_kFile.LoadWhole(m_kOptions.files[0]))
+    if (!m_kFile.LoadWhole(options_.files[0]))
         return false;
-    SayWarnings(m_kOptions, m_kOptions.files[0], m_kFile.Record());
+    SayWarnings(options_, options_.files[0], m_kFile.Record());
     return true;
 }
 
 // A container moves by its first track, under its first node.
 MotionClip CComparedSource::Clip()
 {
-    if (m_kOptions.align)
+    if (options_.align)
         return SourceClipOf(m_kConversion);
     if (!m_kFile.IsContainer())
         return ClipOf(m_kFile.Motion());
-    const std::vector<CFoundNode> nodes = m_kFile.Nodes();
+    const std::vector<FoundNode> nodes = m_kFile.Nodes();
     const CKeyframeControl* track = m_kFile.FirstTrack();
     if (nodes.empty() || !track)
         return {};
@@ -98,7 +98,7 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
     return misfits.empty();
 }
 
-bool WriteComparison(const COptions& options, const std::string& profilePath, const MotionClip& source,
+bool WriteComparison(const ShellOptions& options, const std::string& profilePath, const MotionClip& source,
                      const MotionClip& result, const MeasuredConversion& measured)
 {
     ConvertedMotion motion;
@@ -117,7 +117,7 @@ bool WriteComparison(const COptions& options, const std::string& profilePath, co
 
 } // namespace
 
-EExit RunCompare(const COptions& options)
+EExit RunCompare(const ShellOptions& options)
 {
     if (const EExit page = CheckPagePath(options); page != EExit::Done)
         return page;

@@ -30,7 +30,7 @@ bool WriteWhole(const std::string& path, std::span<const std::byte> bytes)
 
 } // namespace
 
-EExit RunResave(const COptions& options)
+EExit RunResave(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];
@@ -43,20 +43,20 @@ EExit RunResave(const COptions& options)
     return TellWritten(options, source, output);
 }
 
-EExit RunExtract(const COptions& options)
+EExit RunExtract(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     COrrinStream scene;
     if (!MayWrite(options, options.output) || !LoadWhole(scene, source))
         return EExit::Failed;
-    const CPackageBlocks blocks = FindPackage(scene);
+    const PackageBlocks blocks = FindPackage(scene);
     if (!blocks.file)
     {
         SayError(Printable(source) + ": this is not a Kinetra file: its roots must include the data blocks "
                                      "\"MotionInfo\" and \"MotionFile\"");
         return EExit::Failed;
     }
-    CPackageFacts facts;
+    PackageFacts facts;
     const std::string inside = ReadPackageFacts(*blocks.info, facts) ? FormatExtension(facts.format) : "";
     if (!inside.empty() && !HasExtension(options.output, inside))
         SayWord(options, "warning: " + Printable(source) + " contains an " + inside + " file");
@@ -65,7 +65,7 @@ EExit RunExtract(const COptions& options)
     return TellWritten(options, source, options.output);
 }
 
-EExit RunPackage(const COptions& options)
+EExit RunPackage(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];

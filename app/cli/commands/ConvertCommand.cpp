@@ -20,7 +20,7 @@ namespace {
 // is written in small letters.
 bool ResolveOutput(std::string& output)
 {
-    const CPathParts parts = SplitPath(output);
+    const PathParts parts = SplitPath(output);
     if (parts.extension.empty())
         output += ".Kinetra";
     else if (EqualNoCase(parts.extension, ".htr"))
@@ -30,7 +30,7 @@ bool ResolveOutput(std::string& output)
     return true;
 }
 
-bool PlanOne(const COptions& options, CFileRun::Jobs& jobs)
+bool PlanOne(const ShellOptions& options, CFileRun::Jobs& jobs)
 {
     if (options.resume)
         return Refuse("--resume is for many files; it needs --out-dir DIR");
@@ -44,14 +44,14 @@ bool PlanOne(const COptions& options, CFileRun::Jobs& jobs)
     return true;
 }
 
-bool IsOne(const COptions& options)
+bool IsOne(const ShellOptions& options)
 {
     return options.files.size() == 1 && options.filesFrom.empty() && options.outputFolder.empty() &&
            !FolderExists(options.files[0]);
 }
 
 // In this process: a crash costs nothing else.
-EExit RunOne(const COptions& options, const CConversionJob& job)
+EExit RunOne(const ShellOptions& options, const ConversionJob& job)
 {
     std::optional<CPagePart> part;
     if (IsPageAsked(options))
@@ -67,7 +67,7 @@ EExit RunOne(const COptions& options, const CConversionJob& job)
     return outcome == EConversion::Failed || !isWritten ? EExit::Failed : EExit::Done;
 }
 
-EExit ConvertOne(const COptions& options)
+EExit ConvertOne(const ShellOptions& options)
 {
     CFileRun::Jobs jobs;
     if (!PlanOne(options, jobs))
@@ -77,7 +77,7 @@ EExit ConvertOne(const COptions& options)
     return options.report.empty() ? RunOne(options, jobs[0]) : CConversionRun(options, jobs, {}).RunAll();
 }
 
-bool IsManyPossible(const COptions& options)
+bool IsManyPossible(const ShellOptions& options)
 {
     if (options.outputFolder.empty())
         return Refuse("several sources, or a folder, need --out-dir DIR");
@@ -87,7 +87,7 @@ bool IsManyPossible(const COptions& options)
     return true;
 }
 
-EExit ConvertMany(const COptions& options)
+EExit ConvertMany(const ShellOptions& options)
 {
     CFileRun::Jobs jobs;
     if (!IsManyPossible(options))
@@ -101,7 +101,7 @@ EExit ConvertMany(const COptions& options)
 
 } // namespace
 
-EExit RunConvert(const COptions& options)
+EExit RunConvert(const ShellOptions& options)
 {
     if (!IsDecidedOnExisting(options) || !IsRunPossible(options))
         return EExit::Usage;

@@ -46,7 +46,7 @@ void PrintFaults(const std::string& path, const CFindings& findings)
     }
 }
 
-void Print(const COptions& options, const std::string& path, const CFileExam& exam)
+void Print(const ShellOptions& options, const std::string& path, const CFileExam& exam)
 {
     PrintFaults(path, exam.Findings());
     if (options.quiet)
@@ -112,7 +112,7 @@ void BeginJson(CJsonWriter& json, const std::string& path, const CFileExam& exam
     WriteFindings(json, path, exam.Findings(), fixed);
 }
 
-void Tell(const COptions& options, const std::string& path, const CFileExam& exam)
+void Tell(const ShellOptions& options, const std::string& path, const CFileExam& exam)
 {
     if (!options.json)
         return Print(options, path, exam);
@@ -122,7 +122,7 @@ void Tell(const COptions& options, const std::string& path, const CFileExam& exa
     json.EndDocument();
 }
 
-EExit ExamineFile(const COptions& options, const std::string& path)
+EExit ExamineFile(const ShellOptions& options, const std::string& path)
 {
     CFileExam exam;
     Examine(path, exam);
@@ -130,7 +130,7 @@ EExit ExamineFile(const COptions& options, const std::string& path)
     return exam.Findings().HasFaults() ? EExit::Failed : EExit::Done;
 }
 
-bool CanFix(const COptions& options)
+bool CanFix(const ShellOptions& options)
 {
     if (options.files.size() != 1)
         return Refuse("--fix needs exactly one file");
@@ -142,7 +142,7 @@ bool CanFix(const COptions& options)
     return true;
 }
 
-void WriteFixedJson(const COptions& options, const CFileExam& exam, const CFileExam& copy)
+void WriteFixedJson(const ShellOptions& options, const CFileExam& exam, const CFileExam& copy)
 {
     CJsonWriter json(stdout);
     BeginJson(json, options.files[0], exam, true);
@@ -153,7 +153,7 @@ void WriteFixedJson(const COptions& options, const CFileExam& exam, const CFileE
     json.EndDocument();
 }
 
-void TellFixed(const COptions& options, const CFileExam& exam, const CFileExam& copy)
+void TellFixed(const ShellOptions& options, const CFileExam& exam, const CFileExam& copy)
 {
     if (options.json)
         return WriteFixedJson(options, exam, copy);
@@ -168,7 +168,7 @@ void TellFixed(const COptions& options, const CFileExam& exam, const CFileExam& 
 }
 
 // Only what the copy is like counts: whoever goes on takes that.
-EExit FixFile(const COptions& options)
+EExit FixFile(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     CFileExam exam;
@@ -192,7 +192,7 @@ EExit FixFile(const COptions& options)
 
 } // namespace
 
-EExit RunDoctor(const COptions& options)
+EExit RunDoctor(const ShellOptions& options)
 {
     if (!options.fix.empty())
     {

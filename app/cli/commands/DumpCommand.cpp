@@ -31,7 +31,7 @@ bool WriteTreeView(const std::string& folder)
 
 } // namespace
 
-EExit RunDump(const COptions& options)
+EExit RunDump(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     CSceneFile file;

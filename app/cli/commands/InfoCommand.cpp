@@ -56,10 +56,10 @@ void PrintTiming(const Timing& timing)
     std::printf("length:  %g s\n", timing.Seconds());
 }
 
-void PrintBones(const std::vector<CFoundNode>& nodes)
+void PrintBones(const std::vector<FoundNode>& nodes)
 {
     std::printf("bones:   %zu\n", nodes.size());
-    for (const CFoundNode& found : nodes)
+    for (const FoundNode& found : nodes)
         PrintIndented(found.depth + 1, Printable(found.node->NameView()));
 }
 
@@ -72,10 +72,10 @@ void WriteTiming(CJsonWriter& json, const Timing& timing)
     json.Key("seconds").Number(timing.Seconds());
 }
 
-void WriteBones(CJsonWriter& json, const std::vector<CFoundNode>& nodes)
+void WriteBones(CJsonWriter& json, const std::vector<FoundNode>& nodes)
 {
     json.Key("bones").BeginArray();
-    for (const CFoundNode& found : nodes)
+    for (const FoundNode& found : nodes)
     {
         json.BreakLine();
         json.BeginObject();
@@ -120,7 +120,7 @@ void WriteJson(const std::string& path, CSceneFile& file)
 
 } // namespace
 
-EExit RunInfo(const COptions& options)
+EExit RunInfo(const ShellOptions& options)
 {
     const std::string& path = options.files[0];
     CSceneFile file;

@@ -59,7 +59,7 @@ bool ReadReport(const std::string& path, Lines& lines)
 }
 
 // Of a shard that was not run there is no report yet; its sources are left, and that is told.
-bool ReadReports(const COptions& options, const CRunPlan& plan, Lines& lines)
+bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines)
 {
     const std::span named = std::span(options.files).subspan(1);
     for (const std::string& path : named)
@@ -74,7 +74,7 @@ bool ReadReports(const COptions& options, const CRunPlan& plan, Lines& lines)
     return true;
 }
 
-void SayFailures(const COptions& options, const std::string& line)
+void SayFailures(const ShellOptions& options, const std::string& line)
 {
     std::vector<CReport> reports;
     ReadReports(line, reports);
@@ -83,7 +83,7 @@ void SayFailures(const COptions& options, const std::string& line)
 }
 
 // Puts the lines into the order of the plan and counts how they ended.
-std::string Join(const COptions& options, const CRunPlan& plan, const Lines& lines, CRunTally& tally)
+std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines& lines, RunTally& tally)
 {
     std::string joined;
     for (const CRunPlan::Entry& entry : plan.entries)
@@ -114,7 +114,7 @@ void SayLeft(const CRunPlan& plan, const Lines& lines)
     }
 }
 
-bool Write(const COptions& options, const std::string& joined)
+bool Write(const ShellOptions& options, const std::string& joined)
 {
     if (options.output.empty())
     {
@@ -130,7 +130,7 @@ bool Write(const COptions& options, const std::string& joined)
 
 } // namespace
 
-EExit RunMergeReport(const COptions& options)
+EExit RunMergeReport(const ShellOptions& options)
 {
     CRunPlan plan;
     Lines lines;
@@ -138,7 +138,7 @@ EExit RunMergeReport(const COptions& options)
         return EExit::Failed;
     if (!options.output.empty() && !MayWrite(options, options.output))
         return EExit::Failed;
-    CRunTally tally;
+    RunTally tally;
     if (!Write(options, Join(options, plan, lines, tally)))
         return EExit::Failed;
     SayLeft(plan, lines);

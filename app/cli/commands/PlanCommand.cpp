@@ -30,13 +30,13 @@ bool IsUtf8(const std::string& text)
     return json.TakeText("text", kept) && kept == text;
 }
 
-bool MakePlan(const COptions& options, const CFileRun::Jobs& jobs, CRunPlan& plan)
+bool MakePlan(const ShellOptions& options, const CFileRun::Jobs& jobs, CRunPlan& plan)
 {
     plan.version = GAITWRIGHT_VERSION;
     plan.outputFolder = options.outputFolder;
     plan.options = OptionsJson(options, ~kHowToRun);
     plan.shardCount = static_cast<size_t>(*options.shards);
-    for (const CConversionJob& job : jobs)
+    for (const ConversionJob& job : jobs)
     {
         CRunPlan::Entry entry{job.source, job.output};
         FileSize(job.source, entry.byteCount);
@@ -52,7 +52,7 @@ bool MakePlan(const COptions& options, const CFileRun::Jobs& jobs, CRunPlan& pla
     return true;
 }
 
-void TellPlan(const COptions& options, const CRunPlan& plan)
+void TellPlan(const ShellOptions& options, const CRunPlan& plan)
 {
     if (options.json)
     {
@@ -72,7 +72,7 @@ void TellPlan(const COptions& options, const CRunPlan& plan)
 }
 
 // A slip here would be found only when the shards run.
-bool AreSourcesThere(const COptions& options)
+bool AreSourcesThere(const ShellOptions& options)
 {
     for (const std::string& path : options.files)
     {
@@ -84,7 +84,7 @@ bool AreSourcesThere(const COptions& options)
     return true;
 }
 
-bool AreShardsRight(const COptions& options)
+bool AreShardsRight(const ShellOptions& options)
 {
     const bool right = *options.shards >= 1 && *options.shards <= kShardLimit;
     if (!right)
@@ -94,7 +94,7 @@ bool AreShardsRight(const COptions& options)
 
 } // namespace
 
-EExit RunPlan(const COptions& options)
+EExit RunPlan(const ShellOptions& options)
 {
     CFileRun::Jobs jobs;
     if (!AreShardsRight(options) || !IsRunPossible(options))

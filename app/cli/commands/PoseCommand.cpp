@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-void WriteNode(CJsonWriter& json, const CFoundNode& found)
+void WriteNode(CJsonWriter& json, const FoundNode& found)
 {
     json.BeginObject();
     json.Key("name").Text(found.node->NameView());
@@ -25,7 +25,7 @@ void WriteNode(CJsonWriter& json, const CFoundNode& found)
 void WriteNodes(CJsonWriter& json, const CSceneFile& file)
 {
     json.Key("nodes").BeginArray();
-    for (const CFoundNode& found : file.Nodes())
+    for (const FoundNode& found : file.Nodes())
     {
         json.BreakLine();
         WriteNode(json, found);
@@ -49,7 +49,7 @@ void WriteObjects(CJsonWriter& json, CSceneFile& file)
 
 } // namespace
 
-EExit RunPose(const COptions& options)
+EExit RunPose(const ShellOptions& options)
 {
     const std::string& path = options.files[0];
     CSceneFile file;

@@ -29,7 +29,7 @@ struct Entry
 std::vector<Entry> Installed(CShellConversion& conversion)
 {
     std::vector<Entry> entries;
-    for (const CInstalledProfile& profile : conversion.InstalledProfiles())
+    for (const InstalledProfile& profile : conversion.InstalledProfiles())
         entries.push_back({profile.name, profile.path, profile.stock, {}, {}});
     return entries;
 }
@@ -46,11 +46,11 @@ CProfileFit FitOf(const CShellConversion& conversion, const ProfileChoice& choic
 // The one that a conversion takes first.
 std::vector<Entry> ByFit(CShellConversion& conversion)
 {
-    const std::vector<CInstalledProfile> installed = conversion.InstalledProfiles();
+    const std::vector<InstalledProfile> installed = conversion.InstalledProfiles();
     std::vector<Entry> entries;
     for (const ProfileChoice& choice : conversion.Choices())
     {
-        const auto profile = std::ranges::find(installed, choice.path, &CInstalledProfile::path);
+        const auto profile = std::ranges::find(installed, choice.path, &InstalledProfile::path);
         const bool stock = profile != installed.end() && profile->stock;
         entries.push_back({choice.profile.name, choice.path, stock, FitOf(conversion, choice), {}});
         if (choice.match.IsWhole())
@@ -105,7 +105,7 @@ void WriteJson(const std::vector<Entry>& entries)
 
 } // namespace
 
-EExit RunProfiles(const COptions& options)
+EExit RunProfiles(const ShellOptions& options)
 {
     CShellReports reports(options);
     CShellConversion conversion(options, {}, reports);

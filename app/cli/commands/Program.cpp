@@ -23,7 +23,7 @@ EExit RunArguments(int argc, char** argv)
 {
     try
     {
-        const CArguments arguments = ParseArguments(argc, argv);
+        const Arguments arguments = ParseArguments(argc, argv);
         return arguments.command ? arguments.command->run(arguments.options) : arguments.exit;
     } catch (const std::bad_alloc&)
     {

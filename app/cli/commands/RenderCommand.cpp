@@ -28,7 +28,7 @@ PictureMotion Shown(CNode* root, const SourceTiming& timing)
 // The first root that moves, by its first track, dressed so that there is something to see of its bones.
 bool ShowScene(const std::string& path, CSceneFile& file, PictureMotion& motion)
 {
-    for (const CFoundNode& found : file.Nodes())
+    for (const FoundNode& found : file.Nodes())
     {
         const CKeyframeControl* track = found.parent ? nullptr : PreviewTrack(found.node);
         if (!track)
@@ -42,7 +42,7 @@ bool ShowScene(const std::string& path, CSceneFile& file, PictureMotion& motion)
 }
 
 // The trees outlive the files that they come from.
-bool LoadMotion(const COptions& options, const std::string& path, PictureMotion& motion)
+bool LoadMotion(const ShellOptions& options, const std::string& path, PictureMotion& motion)
 {
     CSceneFile file;
     if (!file.LoadWhole(path))
@@ -66,7 +66,7 @@ int ToInt(int64_t number)
 }
 
 // Places for the motions stand, and nothing is in them yet.
-PictureOptions PictureOf(const COptions& options)
+PictureOptions PictureOf(const ShellOptions& options)
 {
     PictureOptions picture;
     picture.motions.resize(options.with.empty() ? 1 : 2);
@@ -82,7 +82,7 @@ std::string SizeText(const PictureOptions& picture)
     return std::to_string(picture.width) + 'x' + std::to_string(picture.height);
 }
 
-bool CanDraw(const COptions& options, const PictureOptions& picture)
+bool CanDraw(const ShellOptions& options, const PictureOptions& picture)
 {
     if (!HasExtension(options.output, ".png"))
         return Refuse(Printable(options.output) + ": the picture must be a .png file");
@@ -95,7 +95,7 @@ bool CanDraw(const COptions& options, const PictureOptions& picture)
 }
 
 // Null for a picture that was not drawn.
-void WriteJson(const COptions& options, const PictureOptions* picture)
+void WriteJson(const ShellOptions& options, const PictureOptions* picture)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -122,7 +122,7 @@ std::string PictureWords(const PictureOptions& picture)
     return SizeText(picture) + " pixels, " + poses;
 }
 
-EExit Tell(const COptions& options, const PictureOptions* picture)
+EExit Tell(const ShellOptions& options, const PictureOptions* picture)
 {
     const std::string words = picture ? PictureWords(*picture) : "skipped, the output exists";
     if (options.json)
@@ -150,7 +150,7 @@ bool Draw(const PictureOptions& options, const std::string& output)
 
 } // namespace
 
-EExit RunRender(const COptions& options)
+EExit RunRender(const ShellOptions& options)
 {
     PictureOptions picture = PictureOf(options);
     if (!IsDecidedOnExisting(options) || !CanDraw(options, picture))

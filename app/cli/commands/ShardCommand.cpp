@@ -13,7 +13,7 @@ namespace gw {
 namespace {
 
 // A shard is run as often as it takes: it goes on behind failures, and passes over what is done.
-bool TakePlan(const CRunPlan& plan, size_t shard, COptions& options)
+bool TakePlan(const CRunPlan& plan, size_t shard, ShellOptions& options)
 {
     std::string wrong;
     const std::string planPath = options.files[0];
@@ -36,7 +36,7 @@ bool TakePlan(const CRunPlan& plan, size_t shard, COptions& options)
     return true;
 }
 
-CRunState ShardState(const CRunPlan& plan, const std::string& planPath, size_t shard)
+RunState ShardState(const CRunPlan& plan, const std::string& planPath, size_t shard)
 {
     const std::string folder = plan.outputFolder.empty() ? SplitPath(planPath).folder : plan.outputFolder;
     return {WithSeparator(folder), "shard-" + std::to_string(shard)};
@@ -53,7 +53,7 @@ bool HasShard(const CRunPlan& plan, int64_t shard)
 
 } // namespace
 
-EExit RunShard(const COptions& given)
+EExit RunShard(const ShellOptions& given)
 {
     CRunPlan plan;
     if (!IsRunPossible(given))
@@ -63,7 +63,7 @@ EExit RunShard(const COptions& given)
     if (!HasShard(plan, *given.shard))
         return EExit::Usage;
     const auto shard = static_cast<size_t>(*given.shard);
-    COptions options = given;
+    ShellOptions options = given;
     if (!TakePlan(plan, shard, options) || !MakeOutputFolder(options))
         return EExit::Failed;
     CFileRun::Jobs jobs;

@@ -32,12 +32,9 @@ constexpr const char* kEvidenceWords[] = {
 constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
 
 constexpr const char* kDoubtWords[] = {
-    "it is not below the expected parent joint",
-    "left and right may be swapped",
-    "the joint before may be the upper arm",
-    "it may be the clavicle",
-    "the legs point up like the trunk",
-    "its bones are out of proportion",
+    "it is not below the expected parent joint", "left and right may be swapped",
+    "the joint before may be the upper arm",     "it may be the clavicle",
+    "the legs point up like the trunk",          "its bones are out of proportion",
 };
 constexpr const char* kDoubtCodes[] = {"not-below",       "sides-swapped", "clavicle-is-arm",
                                        "arm-is-clavicle", "legs-up",       "odd-length"};
@@ -133,7 +130,7 @@ void WriteRow(CJsonWriter& json, const SuggestedRow& row)
     json.EndObject();
 }
 
-void WriteJson(const COptions& options, const std::string& name, const SuggestedProfile& profile)
+void WriteJson(const ShellOptions& options, const std::string& name, const SuggestedProfile& profile)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
@@ -177,7 +174,7 @@ bool WriteProfile(const std::string& path, const std::string& text)
 }
 
 // Results last as long as the source only if the profile has the source's rate.
-void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
+void WarnOfRate(const ShellOptions& options, int sourceRate, int profileRate)
 {
     if (sourceRate == profileRate)
         return;
@@ -191,7 +188,7 @@ void WarnOfRate(const COptions& options, int sourceRate, int profileRate)
 }
 
 // Writes the profile and prints its rows.
-EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
+EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
 {
     const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
     const int frameRate = ProfileRateOf(sourceRoot);
@@ -214,7 +211,7 @@ EExit Deliver(const COptions& options, const SuggestedProfile& profile, CNode* s
 
 } // namespace
 
-EExit RunSuggest(const COptions& options)
+EExit RunSuggest(const ShellOptions& options)
 {
     if (!HasExtension(options.output, ".prf"))
     {

@@ -19,7 +19,7 @@ EExit Fail(const std::string& path, const CFailure& failure)
     return EExit::Failed;
 }
 
-bool CanTranscode(const COptions& options)
+bool CanTranscode(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];
@@ -50,7 +50,7 @@ const char* WhyNoBVH(const CMotionFile& motion)
 
 } // namespace
 
-EExit RunTranscode(const COptions& options)
+EExit RunTranscode(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];

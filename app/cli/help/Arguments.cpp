@@ -40,36 +40,36 @@ bool ScanNumber(std::string_view text, float& number)
 class OptionBinder
 {
 public:
-    OptionBinder(CLI::App& app, const COptionRow& row, COptions& options)
-        : m_kApp(app), m_kRow(row), m_kOptions(options)
+    OptionBinder(CLI::App& app, const OptionRow& row, ShellOptions& options)
+        : app_(app), row_(row), options_(options)
     {
     }
 
-    CLI::Option* operator()(bool COptions::*target) const
+    CLI::Option* operator()(bool ShellOptions::*target) const
     {
-        return m_kApp.add_flag(std::string(m_kRow.names), m_kOptions.*target);
+        return app_.add_flag(std::string(row_.names), options_.*target);
     }
-    CLI::Option* operator()(std::string COptions::*target) const
+    CLI::Option* operator()(std::string ShellOptions::*target) const
     {
-        return m_kApp.add_option(std::string(m_kRow.names), m_kOptions.*target);
+        return app_.add_option(std::string(row_.names), options_.*target);
     }
-    CLI::Option* operator()(int64_t COptions::*target) const
+    CLI::Option* operator()(int64_t ShellOptions::*target) const
     {
-        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+        return Add([number = &(options_.*target)](const std::string& text) {
             if (!ScanInteger(text, *number))
                 throw CLI::ValidationError(Quoted(text) + " is not an integer");
         });
     }
-    CLI::Option* operator()(std::optional<int64_t> COptions::*target) const
+    CLI::Option* operator()(std::optional<int64_t> ShellOptions::*target) const
     {
-        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+        return Add([number = &(options_.*target)](const std::string& text) {
             if (!ScanInteger(text, number->emplace()) || **number < 0)
                 throw CLI::ValidationError(Quoted(text) + " is not a non-negative integer");
         });
     }
-    CLI::Option* operator()(CPixelSize COptions::*target) const
+    CLI::Option* operator()(PixelSize ShellOptions::*target) const
     {
-        return Add([size = &(m_kOptions.*target)](const std::string& text) {
+        return Add([size = &(options_.*target)](const std::string& text) {
             const std::string_view words = text;
             const size_t cross = std::min(text.find('x'), text.size());
             if (!ScanInteger(words.substr(0, cross), size->width) ||
@@ -77,16 +77,16 @@ public:
                 throw CLI::ValidationError(Quoted(text) + " is not a size such as 640x480");
         });
     }
-    CLI::Option* operator()(float COptions::*target) const
+    CLI::Option* operator()(float ShellOptions::*target) const
     {
-        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+        return Add([number = &(options_.*target)](const std::string& text) {
             if (!ScanNumber(text, *number) || !(*number > 0.0f))
                 throw CLI::ValidationError(Quoted(text) + " is not a positive number");
         });
     }
-    CLI::Option* operator()(std::optional<float> COptions::*target) const
+    CLI::Option* operator()(std::optional<float> ShellOptions::*target) const
     {
-        return Add([number = &(m_kOptions.*target)](const std::string& text) {
+        return Add([number = &(options_.*target)](const std::string& text) {
             if (!ScanNumber(text, number->emplace()))
                 throw CLI::ValidationError(Quoted(text) + " is not a number");
         });
@@ -97,12 +97,12 @@ private:
     // none.
     CLI::Option* Add(const std::function<void(const std::string&)>& take) const
     {
-        return m_kApp.add_option_function<std::string>(std::string(m_kRow.names), take);
+        return app_.add_option_function<std::string>(std::string(row_.names), take);
     }
 
-    CLI::App& m_kApp;
-    const COptionRow& m_kRow;
-    COptions& m_kOptions;
+    CLI::App& app_;
+    const OptionRow& row_;
+    ShellOptions& options_;
 };
 
 CLI::Validator OneOf(std::string_view choices)
@@ -119,9 +119,9 @@ CLI::Validator OneOf(std::string_view choices)
     return CLI::Validator(check, std::string(choices));
 }
 
-void AddOptions(CLI::App& app, const CCommand& command, COptions& options)
+void AddOptions(CLI::App& app, const ShellCommand& command, ShellOptions& options)
 {
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
     {
         if (!(OptionsOf(command) & row.bit))
             continue;
@@ -135,19 +135,19 @@ void AddOptions(CLI::App& app, const CCommand& command, COptions& options)
 }
 
 // How many of the options of which one must be there a command line has.
-size_t CountChosen(const CLI::App& app, const CCommand& command)
+size_t CountChosen(const CLI::App& app, const ShellCommand& command)
 {
     size_t chosen = 0;
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
         chosen += command.choice & row.bit && app.count(std::string(row.names)) > 0 ? 1 : 0;
     return chosen;
 }
 
 // All forms of the options that a command takes: "-o", "--output", ...
-std::vector<std::string> OptionNames(const CCommand& command)
+std::vector<std::string> OptionNames(const ShellCommand& command)
 {
     std::vector<std::string> names{"--help"};
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
     {
         std::string_view rest = OptionsOf(command) & row.bit ? row.names : std::string_view();
         for (std::string_view name = NextToken(rest); !name.empty(); name = NextToken(rest))
@@ -164,13 +164,13 @@ EExit Refuse(std::string_view words, std::string_view nearest, const std::string
     return EExit::Usage;
 }
 
-EExit RefuseFor(const CCommand& command, std::string_view words, std::string_view nearest = {})
+EExit RefuseFor(const ShellCommand& command, std::string_view words, std::string_view nearest = {})
 {
     return Refuse(words, nearest, "usage: " + UsageLine(command));
 }
 
 // An option that the command does not have; with "=value" behind it or not.
-EExit RefuseUnknown(const CCommand& command, const std::string& argument)
+EExit RefuseUnknown(const ShellCommand& command, const std::string& argument)
 {
     const std::string name = argument.substr(0, argument.find('='));
     const std::string words = std::string(command.name) + " has no option " + Quoted(name);
@@ -180,7 +180,7 @@ EExit RefuseUnknown(const CCommand& command, const std::string& argument)
 std::vector<std::string> CommandNames()
 {
     std::vector<std::string> names;
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         names.emplace_back(command.name);
     return names;
 }
@@ -192,7 +192,7 @@ EExit Print(const std::string& text)
 }
 
 // Nothing where the command may run. A wrong option is told before what is missing.
-std::optional<EExit> ParseFor(const CCommand& command, int argc, char** argv, COptions& options)
+std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv, ShellOptions& options)
 {
     CLI::App app;
     AddOptions(app, command, options);
@@ -228,12 +228,12 @@ std::string Version()
 }
 
 // What the program tells of itself, in the place of a command. The last ones are for who packages it.
-struct CSelfRow
+struct SelfRow
 {
     std::string_view words;
     std::string (*text)();
 };
-constexpr CSelfRow kSelf[] = {
+constexpr SelfRow kSelf[] = {
     {"--help",            ProgramHelp   },
     {"-h",                ProgramHelp   },
     {"--version",         Version       },
@@ -246,7 +246,7 @@ constexpr CSelfRow kSelf[] = {
 EExit ParseWithoutCommand(std::string_view word, std::string_view next)
 {
     const std::string both = std::string(word) + ' ' + std::string(next);
-    for (const CSelfRow& row : kSelf)
+    for (const SelfRow& row : kSelf)
     {
         if (row.words == word || row.words == both)
             return Print(row.text());
@@ -259,11 +259,11 @@ EExit ParseWithoutCommand(std::string_view word, std::string_view next)
 
 } // namespace
 
-CArguments ParseArguments(int argc, char** argv)
+Arguments ParseArguments(int argc, char** argv)
 {
-    CArguments arguments;
+    Arguments arguments;
     const std::string_view word = argc > 1 ? argv[1] : "";
-    const auto command = std::ranges::find(Commands(), word, &CCommand::name);
+    const auto command = std::ranges::find(Commands(), word, &ShellCommand::name);
     if (command == Commands().end())
     {
         arguments.exit = ParseWithoutCommand(word, argc > 2 ? argv[2] : "");

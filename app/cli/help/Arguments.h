@@ -1,21 +1,21 @@
 #pragma once
 
-#include "COptions.h"
+#include "ShellOptions.h"
 
 namespace gw {
 
-struct CCommand;
+struct ShellCommand;
 
 /// What came of reading a command line: a command to run, or an exit code where everything is said already.
-struct CArguments
+struct Arguments
 {
-    const CCommand* command = nullptr;
-    COptions options;
+    const ShellCommand* command = nullptr;
+    ShellOptions options;
     EExit exit = EExit::Done; ///< counts where there is no command
 };
 
 /// Reads a command line. Help goes to standard output; what is wrong goes to standard error with the nearest
 /// right word.
-CArguments ParseArguments(int argc, char** argv);
+Arguments ParseArguments(int argc, char** argv);
 
 } // namespace gw

@@ -75,7 +75,7 @@ std::string OfferCall(const CompletedWord& word)
 std::string ValueCases()
 {
     std::string text;
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
     {
         const CompletedWord value = ValueOf(row);
         if (value.offer != EOffer::Nothing)
@@ -84,10 +84,10 @@ std::string ValueCases()
     return text;
 }
 
-std::string OptionWords(const CCommand& command)
+std::string OptionWords(const ShellCommand& command)
 {
     std::string text;
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
         text += HasOption(command, row) ? Joined(Parts(row.names, ","), " ") + ' ' : std::string();
     return text + "-h --help";
 }
@@ -95,7 +95,7 @@ std::string OptionWords(const CCommand& command)
 std::string CommandCases()
 {
     std::string text;
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         text += "    " + std::string(command.name) + ")\n        options='" + OptionWords(command) +
                 "'\n        [[ $word == -* ]] || " + OfferCall(AnyOperandOf(command)) + "\n        ;;\n";
     return text;
@@ -104,7 +104,7 @@ std::string CommandCases()
 std::string CommandWords()
 {
     std::string text;
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         text += std::string(command.name) + ' ';
     return text;
 }

@@ -7,9 +7,9 @@ namespace gw {
 namespace {
 
 // Rows are calls, which the formatter leaves as they are read.
-constexpr CCommand Row(std::string_view name, std::string_view operands, uint64_t options, uint64_t required,
-                       EExit (*run)(const COptions&), std::string_view help, std::string_view example,
-                       uint64_t choice = 0)
+constexpr ShellCommand Row(std::string_view name, std::string_view operands, uint64_t options,
+                           uint64_t required, EExit (*run)(const ShellOptions&), std::string_view help,
+                           std::string_view example, uint64_t choice = 0)
 {
     return {name, operands, options, required, run, help, example, choice};
 }
@@ -30,7 +30,7 @@ constexpr uint64_t kPlanOptions =
 
 constexpr uint64_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
 
-constexpr CCommand kCommands[] = {
+constexpr ShellCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
         "Convert a motion to the target skeleton and save it as a Kinetra file.\n"
         "Without --profile, the matching stock profile is used, or else the installed profile that matches\n"
@@ -38,7 +38,8 @@ constexpr CCommand kCommands[] = {
         "and its confidence. A profile that confuses left and right, or arm and clavicle, is used only if\n"
         "you name it. If the names in the source share a prefix (Model_, mixamorig3:), it is added to those\n"
         "of the profile.\n"
-        "If OUT ends in .htr, only the motion file is written. Several sources, or a folder, need --out-dir;\n"
+        "If OUT ends in .htr, only the motion file is written. Several sources, or a folder, need "
+        "--out-dir;\n"
         "results keep the folder structure of their sources. Many files are converted by several processes:\n"
         "one that crashes or hangs loses only its own file. The first failure ends the run unless you pass\n"
         "--keep-going. Results and messages are the same for any number of processes.\n"
@@ -50,13 +51,15 @@ constexpr CCommand kCommands[] = {
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
     Row("batch", "FOLDER", kBatchOptions, kJob, RunBatchFolder,
         "Convert every .bvh in a folder to an .htr next to it, or package every .htr.\n"
-        "Packages are written as .orn files. Existing files are replaced, and the first failure ends the run.\n"
+        "Packages are written as .orn files. Existing files are replaced, and the first failure ends the "
+        "run.\n"
         "--out-dir also converts subfolders and writes the results to the same tree there.",
         "gaitwright batch takes --job htr --profile \"Poser BVH\""),
     Row("plan", "SOURCE...", kPlanOptions, kOutput | kShards, RunPlan,
         "Divide a run over many files into shards, for several machines or tasks.\n"
         "Shards are about the same amount of work. Without --out-dir, results go next to their sources.\n"
-        "Relative paths start at the folder where 'gaitwright run' is started. A run continues when a source\n"
+        "Relative paths start at the folder where 'gaitwright run' is started. A run continues when a "
+        "source\n"
         "fails.",
         "gaitwright plan archive --shards 8 -o plan.jsonl --out-dir results"),
     Row("run", "PLAN", kForce | kJobs | kReport | kTimeLimit | kShard, kShard, RunShard,
@@ -82,7 +85,8 @@ constexpr CCommand kCommands[] = {
     Row("align", "SOURCE", kOutput | kProfile | kForce, kOutput, RunAlign,
         "Write a motion as a .bvh with the same joints in the same places, relative to a T-pose.\n"
         "In the new zero pose the figure faces +Z, Y is up, and every limb lies along its axis. The source\n"
-        "may have an A-pose, arms down, bones along X, Z up, slanted bones with rotated frames, or positions\n"
+        "may have an A-pose, arms down, bones along X, Z up, slanted bones with rotated frames, or "
+        "positions\n"
         "that repeat the offsets. If its up axis is not Y, the whole motion is rotated. The joints are\n"
         "identified by --profile, or else by the installed profile that matches best.",
         "gaitwright align walk.bvh -o walk-aligned.bvh"),
@@ -98,7 +102,8 @@ constexpr CCommand kCommands[] = {
         "gaitwright package walk.htr walk.Kinetra --rate 30"),
     Row("doctor", "FILE...", kFix | kForce, 0, RunDoctor,
         "Report what is wrong with motion files, where, and how to fix it.\n"
-        "Prints one line per fault, as FILE:LINE: CODE: MESSAGE, and one line of facts per file: rate, units,\n"
+        "Prints one line per fault, as FILE:LINE: CODE: MESSAGE, and one line of facts per file: rate, "
+        "units,\n"
         "up axis, rest pose, how the body was found. The exit code is 1 if there is a fault.\n"
         "--fix writes a copy of one .bvh file without the faults that can be repaired without changing the\n"
         "motion. The copy is checked too, and the exit code is for the copy.",
@@ -134,18 +139,18 @@ size_t CountWords(std::string_view text)
 
 } // namespace
 
-size_t LeastOperands(const CCommand& command)
+size_t LeastOperands(const ShellCommand& command)
 {
     const auto optional = std::ranges::count(command.operands, '[');
     return CountWords(command.operands) - static_cast<size_t>(optional);
 }
 
-size_t MostOperands(const CCommand& command)
+size_t MostOperands(const ShellCommand& command)
 {
     return command.operands.find("...") != command.operands.npos ? SIZE_MAX : CountWords(command.operands);
 }
 
-std::span<const CCommand> Commands()
+std::span<const ShellCommand> Commands()
 {
     return kCommands;
 }

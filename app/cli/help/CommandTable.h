@@ -1,6 +1,6 @@
 #pragma once
 
-#include "COptions.h"
+#include "ShellOptions.h"
 
 #include <cstddef>
 #include <span>
@@ -53,43 +53,43 @@ inline constexpr uint64_t kHowToRun = kOutput | kOutputFolder | kForce | kSkipEx
                                       kResume | kReport | kTimeLimit | kShards | kShard;
 
 /// One command of the program.
-struct CCommand
+struct ShellCommand
 {
     std::string_view name;
     std::string_view operands; ///< as the usage line shows them: "IN OUT", "[SOURCE]", "SOURCE..."
     uint64_t options;          ///< bits of EOption beside those that every command takes
     uint64_t required;         ///< which of them must be there
-    EExit (*run)(const COptions& options);
+    EExit (*run)(const ShellOptions& options);
     std::string_view help; ///< the first line stands in the list of commands
     std::string_view example;
     uint64_t choice; ///< of these exactly one must be there; 0 for no such choice
 };
 
 /// How many operands a command takes.
-size_t LeastOperands(const CCommand& command);
-size_t MostOperands(const CCommand& command);
+size_t LeastOperands(const ShellCommand& command);
+size_t MostOperands(const ShellCommand& command);
 
 /// The table of commands, in the order of the help.
-std::span<const CCommand> Commands();
+std::span<const ShellCommand> Commands();
 
 // The commands. Each prints results on standard output and words on standard error.
-EExit RunConvert(const COptions& options);
-EExit RunBatchFolder(const COptions& options);
-EExit RunPlan(const COptions& options);
-EExit RunShard(const COptions& options);
-EExit RunMergeReport(const COptions& options);
-EExit RunInfo(const COptions& options);
-EExit RunPose(const COptions& options);
-EExit RunTranscode(const COptions& options);
-EExit RunResave(const COptions& options);
-EExit RunExtract(const COptions& options);
-EExit RunPackage(const COptions& options);
-EExit RunProfiles(const COptions& options);
-EExit RunSuggest(const COptions& options);
-EExit RunCompare(const COptions& options);
-EExit RunDump(const COptions& options);
-EExit RunRender(const COptions& options);
-EExit RunDoctor(const COptions& options);
-EExit RunAlign(const COptions& options);
+EExit RunConvert(const ShellOptions& options);
+EExit RunBatchFolder(const ShellOptions& options);
+EExit RunPlan(const ShellOptions& options);
+EExit RunShard(const ShellOptions& options);
+EExit RunMergeReport(const ShellOptions& options);
+EExit RunInfo(const ShellOptions& options);
+EExit RunPose(const ShellOptions& options);
+EExit RunTranscode(const ShellOptions& options);
+EExit RunResave(const ShellOptions& options);
+EExit RunExtract(const ShellOptions& options);
+EExit RunPackage(const ShellOptions& options);
+EExit RunProfiles(const ShellOptions& options);
+EExit RunSuggest(const ShellOptions& options);
+EExit RunCompare(const ShellOptions& options);
+EExit RunDump(const ShellOptions& options);
+EExit RunRender(const ShellOptions& options);
+EExit RunDoctor(const ShellOptions& options);
+EExit RunAlign(const ShellOptions& options);
 
 } // namespace gw

@@ -10,13 +10,13 @@ namespace {
 
 // The words of usage lines that tell what they stand for. Any other is a file, or a number where it is read
 // as one.
-struct CWordRow
+struct WordRow
 {
     std::string_view name;
     EOffer offer;
     std::string_view words;
 };
-constexpr CWordRow kWords[] = {
+constexpr WordRow kWords[] = {
     {"DIR",       EOffer::Folders,  {}                   },
     {"FOLDER",    EOffer::Folders,  {}                   },
     {"SOURCE",    EOffer::Files,    "bvh htr cha chb orn"},
@@ -29,7 +29,7 @@ constexpr CWordRow kWords[] = {
 
 CompletedWord WordOf(std::string_view name)
 {
-    const auto row = std::ranges::find(kWords, name, &CWordRow::name);
+    const auto row = std::ranges::find(kWords, name, &WordRow::name);
     if (row == std::end(kWords))
         return {.name = name};
     return {.name = name, .offer = row->offer, .words = Parts(row->words, " ")};
@@ -37,12 +37,12 @@ CompletedWord WordOf(std::string_view name)
 
 bool IsText(const COptionTarget& target)
 {
-    return std::holds_alternative<std::string COptions::*>(target);
+    return std::holds_alternative<std::string ShellOptions::*>(target);
 }
 
 } // namespace
 
-CompletedWord ValueOf(const COptionRow& row)
+CompletedWord ValueOf(const OptionRow& row)
 {
     if (row.value.empty())
         return {.offer = EOffer::Nothing};
@@ -53,7 +53,7 @@ CompletedWord ValueOf(const COptionRow& row)
     return WordOf(row.value);
 }
 
-std::vector<CompletedWord> OperandsOf(const CCommand& command)
+std::vector<CompletedWord> OperandsOf(const ShellCommand& command)
 {
     std::vector<CompletedWord> operands;
     for (const std::string_view text : Parts(command.operands, " "))
@@ -67,7 +67,7 @@ std::vector<CompletedWord> OperandsOf(const CCommand& command)
     return operands;
 }
 
-CompletedWord AnyOperandOf(const CCommand& command)
+CompletedWord AnyOperandOf(const ShellCommand& command)
 {
     CompletedWord any = {.offer = EOffer::Nothing};
     for (const CompletedWord& operand : OperandsOf(command))
@@ -82,7 +82,7 @@ CompletedWord AnyOperandOf(const CCommand& command)
     return any;
 }
 
-bool HasOption(const CCommand& command, const COptionRow& row)
+bool HasOption(const ShellCommand& command, const OptionRow& row)
 {
     return (OptionsOf(command) & row.bit) != 0;
 }

@@ -31,13 +31,13 @@ struct CompletedWord
 };
 
 /// What may stand behind an option.
-CompletedWord ValueOf(const COptionRow& row);
+CompletedWord ValueOf(const OptionRow& row);
 /// A command's operands, in their order.
-std::vector<CompletedWord> OperandsOf(const CCommand& command);
+std::vector<CompletedWord> OperandsOf(const ShellCommand& command);
 /// What any of them may be, for shells that do not tell which one a word is.
-CompletedWord AnyOperandOf(const CCommand& command);
+CompletedWord AnyOperandOf(const ShellCommand& command);
 /// Whether a command takes an option.
-bool HasOption(const CCommand& command, const COptionRow& row);
+bool HasOption(const ShellCommand& command, const OptionRow& row);
 /// The parts of a text, as of an option's names or choices.
 std::vector<std::string_view> Parts(std::string_view text, std::string_view delimiters);
 /// Words in a row with a separator between them.

@@ -54,10 +54,10 @@ std::string Line(const std::string& commands)
     return "complete -c gaitwright -n '__fish_seen_subcommand_from" + commands + '\'';
 }
 
-std::string OptionLine(const COptionRow& row)
+std::string OptionLine(const OptionRow& row)
 {
     std::string commands, names;
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         commands += HasOption(command, row) ? ' ' + std::string(command.name) : std::string();
     for (const std::string_view name : Parts(row.names, ","))
     {
@@ -67,7 +67,7 @@ std::string OptionLine(const COptionRow& row)
     return Line(commands) + names + Offer(ValueOf(row)) + " -d " + FishQuoted(row.help) + '\n';
 }
 
-std::string CommandLines(const CCommand& command)
+std::string CommandLines(const ShellCommand& command)
 {
     const std::string name(command.name);
     const bool takesFolder = AnyOperandOf(command).offer == EOffer::Folders;
@@ -81,9 +81,9 @@ std::string CommandLines(const CCommand& command)
 std::string FishCompletion()
 {
     std::string text(kFishHead);
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         text += CommandLines(command);
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
         text += OptionLine(row);
     return text;
 }

@@ -72,7 +72,7 @@ std::string OptionEntry(std::string_view names, std::string_view value, std::str
 std::string OptionEntries(uint64_t bits)
 {
     std::string text;
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
         text += (bits & row.bit) != 0 ? OptionEntry(row.names, row.value, row.help) : std::string();
     return text;
 }
@@ -81,13 +81,13 @@ std::string OptionEntries(uint64_t bits)
 uint64_t SharedOptions()
 {
     uint64_t shared = ~uint64_t{0};
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         shared &= OptionsOf(command);
     return shared;
 }
 
 // The first line of a help text is a separate sentence; the rest was wrapped by hand.
-std::string CommandEntry(const CCommand& command)
+std::string CommandEntry(const ShellCommand& command)
 {
     const std::string_view help = command.help;
     const size_t firstEnd = std::min(help.find('\n'), help.size());
@@ -106,7 +106,7 @@ std::string ManPage()
     page += ".SH OPTIONS\nFor every command:\n" + OptionEntries(SharedOptions()) +
             OptionEntry("-h,--help", {}, "show the help of a command") +
             OptionEntry("--version", {}, "show the version; used without a command") + ".SH COMMANDS\n";
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
         page += CommandEntry(command);
     return page + ".SH EXIT STATUS\n" + std::string(kExitCodes) + '\n' + std::string(kTail);
 }

@@ -9,12 +9,12 @@ namespace gw {
 
 /// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, any number,
 /// an integer, a whole number from 0 on, a size.
-using COptionTarget = std::variant<bool COptions::*, std::string COptions::*, float COptions::*,
-                                   std::optional<float> COptions::*, int64_t COptions::*,
-                                   std::optional<int64_t> COptions::*, CPixelSize COptions::*>;
+using COptionTarget = std::variant<bool ShellOptions::*, std::string ShellOptions::*, float ShellOptions::*,
+                                   std::optional<float> ShellOptions::*, int64_t ShellOptions::*,
+                                   std::optional<int64_t> ShellOptions::*, PixelSize ShellOptions::*>;
 
 /// One option of the program.
-struct COptionRow
+struct OptionRow
 {
     EOption bit;
     std::string_view names; ///< "-o,--output"
@@ -25,21 +25,21 @@ struct COptionRow
 };
 
 /// The table of options, in the order of the help.
-std::span<const COptionRow> OptionTable();
+std::span<const OptionRow> OptionTable();
 
 /// What the program's answer to the shell means.
 inline constexpr std::string_view kExitCodes = "0 done, 1 some work failed, 2 wrong usage, 130 interrupted.";
 
 /// The bits of all options that a command takes.
-uint64_t OptionsOf(const CCommand& command);
+uint64_t OptionsOf(const ShellCommand& command);
 
 /// The help of the program: every command with a line.
 std::string ProgramHelp();
 /// The help of a command: usage, what it does, options, an example.
-std::string CommandHelp(const CCommand& command);
+std::string CommandHelp(const ShellCommand& command);
 /// "gaitwright pose FILE --frame N [OPTIONS]".
-std::string UsageLine(const CCommand& command);
+std::string UsageLine(const ShellCommand& command);
 /// The options that a command takes one of: "--frame N | --time T".
-std::string ChoiceText(const CCommand& command);
+std::string ChoiceText(const ShellCommand& command);
 
 } // namespace gw

@@ -56,7 +56,7 @@ std::string Action(const CompletedWord& word)
 }
 
 // "'(-o --output)'{-o,--output}'[the file to write]:OUT:_files'"
-std::string OptionWord(const COptionRow& row)
+std::string OptionWord(const OptionRow& row)
 {
     const std::vector<std::string_view> names = Parts(row.names, ",");
     const std::string rest = '[' + ZshQuoted(row.help) + ']' + Action(ValueOf(row)) + '\'';
@@ -65,7 +65,7 @@ std::string OptionWord(const COptionRow& row)
     return "'(" + Joined(names, " ") + ")'{" + std::string(row.names) + "}'" + rest;
 }
 
-std::string OperandWords(const CCommand& command)
+std::string OperandWords(const ShellCommand& command)
 {
     std::string text;
     size_t position = 0;
@@ -78,10 +78,10 @@ std::string OperandWords(const CCommand& command)
     return text;
 }
 
-std::string CommandCase(const CCommand& command)
+std::string CommandCase(const ShellCommand& command)
 {
     std::string text = "    " + std::string(command.name) + ")\n        _arguments";
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
         text += HasOption(command, row) ? " \\\n            " + OptionWord(row) : std::string();
     return text + " \\\n            '(-h --help)'{-h,--help}'[show the help of the command]'" +
            OperandWords(command) + "\n        ;;\n";
@@ -92,7 +92,7 @@ std::string CommandCase(const CCommand& command)
 std::string ZshCompletion()
 {
     std::string names, cases;
-    for (const CCommand& command : Commands())
+    for (const ShellCommand& command : Commands())
     {
         const std::string_view help = command.help.substr(0, command.help.find('\n'));
         names += "        '" + std::string(command.name) + ':' + ZshQuoted(help) + "'\n";

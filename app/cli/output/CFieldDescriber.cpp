@@ -84,7 +84,7 @@ CFieldDescriber::PendingCount CFieldDescriber::TakeCount(std::string_view nextNa
     if (!pending.name.empty() && IsTold(EDescribe::Fields))
     {
         Key(pending.name);
-        m_kJson.Integer(static_cast<int64_t>(pending.count));
+        json_.Integer(static_cast<int64_t>(pending.count));
     }
     return {};
 }
@@ -94,11 +94,11 @@ void CFieldDescriber::Key(std::string_view name)
     if (!m_kNest.empty())
     {
         if (!m_kNest.back())
-            m_kJson.Key(name);
+            json_.Key(name);
         return;
     }
     const int earlier = m_kSeen[std::string(name)]++;
-    m_kJson.Key(earlier == 0 ? std::string(name) : std::string(name) + '[' + std::to_string(earlier) + ']');
+    json_.Key(earlier == 0 ? std::string(name) : std::string(name) + '[' + std::to_string(earlier) + ']');
 }
 
 void CFieldDescriber::Text(const char* name, CText& text)
@@ -108,9 +108,9 @@ void CFieldDescriber::Text(const char* name, CText& text)
         return;
     Key(name);
     if (text.IsNull())
-        m_kJson.Null();
+        json_.Null();
     else
-        m_kJson.Text(text.View());
+        json_.Text(text.View());
 }
 
 bool CFieldDescriber::Presence(const char* name, bool present)
@@ -123,7 +123,7 @@ bool CFieldDescriber::Presence(const char* name, bool present)
     else if (IsTold(EDescribe::Fields))
     {
         Key(name);
-        m_kJson.Null();
+        json_.Null();
     }
     return present;
 }
@@ -143,13 +143,13 @@ void CFieldDescriber::Values(const char* name, EFieldKind kind, void* values, si
     Key(name);
     const std::byte* value = static_cast<const std::byte*>(values);
     if (!isBlock)
-        return WriteValue(m_kJson, kind, value);
+        return WriteValue(json_, kind, value);
     if (kind == EFieldKind::Byte)
-        return WriteBytes(m_kJson, value, count);
-    m_kJson.BeginArray();
+        return WriteBytes(json_, value, count);
+    json_.BeginArray();
     for (size_t i = 0; i < count; ++i)
-        WriteValue(m_kJson, kind, value + i * FieldBytes(kind));
-    m_kJson.EndArray();
+        WriteValue(json_, kind, value + i * FieldBytes(kind));
+    json_.EndArray();
 }
 
 void CFieldDescriber::Slot(const char* name, const CLinkSlot& slot)
@@ -158,11 +158,11 @@ void CFieldDescriber::Slot(const char* name, const CLinkSlot& slot)
     if (!IsTold(EDescribe::Links))
         return;
     Key(name);
-    const auto number = m_kNumbers.find(slot.Get());
-    if (number == m_kNumbers.end())
-        m_kJson.Null();
+    const auto number = numbers_.find(slot.Get());
+    if (number == numbers_.end())
+        json_.Null();
     else
-        m_kJson.Integer(static_cast<int64_t>(number->second));
+        json_.Integer(static_cast<int64_t>(number->second));
 }
 
 void CFieldDescriber::BeginArray(const char* name, EListKind kind)
@@ -173,7 +173,7 @@ void CFieldDescriber::BeginArray(const char* name, EListKind kind)
     if (m_bArrayIsTold)
     {
         Key(name);
-        m_kJson.BeginArray();
+        json_.BeginArray();
     }
     m_kNest.push_back(true);
 }
@@ -183,13 +183,13 @@ void CFieldDescriber::EndArray()
     TakeCount({});
     m_kNest.pop_back();
     if (m_bArrayIsTold)
-        m_kJson.EndArray();
+        json_.EndArray();
 }
 
 void CFieldDescriber::BeginElement()
 {
     if (m_bArrayIsTold)
-        m_kJson.BeginObject();
+        json_.BeginObject();
     m_kNest.push_back(false);
 }
 
@@ -198,7 +198,7 @@ void CFieldDescriber::EndElement()
     TakeCount({});
     m_kNest.pop_back();
     if (m_bArrayIsTold)
-        m_kJson.EndObject();
+        json_.EndObject();
 }
 
 } // namespace gw

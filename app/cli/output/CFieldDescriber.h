@@ -32,7 +32,7 @@ class CFieldDescriber : public CFieldArchive
 {
 public:
     CFieldDescriber(EDescribe what, CJsonWriter& json, const CObjectNumbers& numbers)
-        : CFieldArchive(false, kNewestVersion), m_eWhat(what), m_kJson(json), m_kNumbers(numbers)
+        : CFieldArchive(false, kNewestVersion), m_eWhat(what), json_(json), numbers_(numbers)
     {
     }
     ~CFieldDescriber() override { TakeCount({}); }
@@ -63,8 +63,8 @@ private:
     void Key(std::string_view name);
 
     EDescribe m_eWhat;
-    CJsonWriter& m_kJson;
-    const CObjectNumbers& m_kNumbers;
+    CJsonWriter& json_;
+    const CObjectNumbers& numbers_;
     PendingCount m_kCount;
     std::vector<bool> m_kNest; ///< arrays (true) and their elements (false) around the present place
     bool m_bArrayIsTold = false;

@@ -29,9 +29,9 @@ std::string FormatName(uint32_t format)
     return extension.empty() ? "unknown" : extension.substr(1);
 }
 
-void PrintPackage(const CPackageBlocks& blocks)
+void PrintPackage(const PackageBlocks& blocks)
 {
-    CPackageFacts facts;
+    PackageFacts facts;
     if (blocks.info && ReadPackageFacts(*blocks.info, facts))
         std::printf("MotionInfo: version %u, format %s, rate %g, %g\n", facts.version,
                     FormatName(facts.format).c_str(), facts.rate, facts.sixty);
@@ -39,9 +39,9 @@ void PrintPackage(const CPackageBlocks& blocks)
         std::printf("MotionFile: %zu bytes\n", blocks.file->Data().size());
 }
 
-void WritePackage(CJsonWriter& json, const CPackageBlocks& blocks)
+void WritePackage(CJsonWriter& json, const PackageBlocks& blocks)
 {
-    CPackageFacts facts;
+    PackageFacts facts;
     json.Key("package");
     if (!blocks.info || !ReadPackageFacts(*blocks.info, facts))
         return json.Null();

@@ -11,7 +11,7 @@
 
 namespace gw {
 
-bool IsDecidedOnExisting(const COptions& options)
+bool IsDecidedOnExisting(const ShellOptions& options)
 {
     if (!options.force || !options.skipExisting)
         return true;
@@ -29,7 +29,7 @@ CReport UnreadableFolder(const std::string& path)
     return ShellFailure(path, "unreadable-folder", "the folder cannot be read (check its permissions)");
 }
 
-bool CanListFolder(const COptions& options, const std::string& path)
+bool CanListFolder(const ShellOptions& options, const std::string& path)
 {
     std::error_code error;
     const std::filesystem::directory_iterator entries(path, error);
@@ -44,7 +44,7 @@ bool IsSameFile(const std::string& a, const std::string& b)
     return std::filesystem::equivalent(a, b, error);
 }
 
-std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& path)
+std::optional<CReport> WhyNotWrite(const ShellOptions& options, const std::string& path)
 {
     if (FolderExists(path))
         return ShellFailure(path, "folder", "this is a folder; name the file to write");
@@ -59,7 +59,7 @@ std::optional<CReport> WhyNotWrite(const COptions& options, const std::string& p
     return std::nullopt;
 }
 
-bool MayWrite(const COptions& options, const std::string& path)
+bool MayWrite(const ShellOptions& options, const std::string& path)
 {
     const std::optional<CReport> refusal = WhyNotWrite(options, path);
     if (refusal)
@@ -67,7 +67,7 @@ bool MayWrite(const COptions& options, const std::string& path)
     return !refusal;
 }
 
-EExit TellWritten(const COptions& options, const std::string& source, const std::string& output)
+EExit TellWritten(const ShellOptions& options, const std::string& source, const std::string& output)
 {
     if (options.json)
     {

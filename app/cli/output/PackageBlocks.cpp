@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-static_assert(sizeof(CPackageFacts) == 16); // as it lies in the file
+static_assert(sizeof(PackageFacts) == 16); // as it lies in the file
 
 // A chain is as long as the objects in the file, and a ring is refused when it is read.
 CRawData* FindInChain(CCustomData* data, const char* name)
@@ -25,9 +25,9 @@ CRawData* FindInChain(CCustomData* data, const char* name)
 
 } // namespace
 
-CPackageBlocks FindPackage(const COrrinStream& scene)
+PackageBlocks FindPackage(const COrrinStream& scene)
 {
-    CPackageBlocks blocks;
+    PackageBlocks blocks;
     for (size_t i = 0; i < scene.GetRootCount() && !blocks.info; ++i)
         blocks.info = FindInChain(RecordCast<CRawData>(scene.GetRoot(i)), "MotionInfo");
     if (blocks.info)
@@ -35,7 +35,7 @@ CPackageBlocks FindPackage(const COrrinStream& scene)
     return blocks;
 }
 
-bool ReadPackageFacts(const CRawData& info, CPackageFacts& facts)
+bool ReadPackageFacts(const CRawData& info, PackageFacts& facts)
 {
     const std::span<const std::byte> bytes = info.Data();
     if (bytes.size() != sizeof facts)

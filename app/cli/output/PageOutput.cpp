@@ -8,7 +8,7 @@
 
 namespace gw {
 
-EExit CheckPagePath(const COptions& options)
+EExit CheckPagePath(const ShellOptions& options)
 {
     const std::string& path = options.html;
     if (path.empty())
@@ -21,7 +21,7 @@ EExit CheckPagePath(const COptions& options)
     return MayWrite(options, path) ? EExit::Done : EExit::Failed;
 }
 
-bool HasPageFolder(const COptions& options)
+bool HasPageFolder(const ShellOptions& options)
 {
     const std::string folder = SplitPath(options.html).folder;
     if (options.dryRun || folder.empty() || FolderExists(folder))
@@ -30,7 +30,7 @@ bool HasPageFolder(const COptions& options)
     return false;
 }
 
-bool WritePage(const COptions& options, CConversionPage& page)
+bool WritePage(const ShellOptions& options, CConversionPage& page)
 {
     if (!page.Write(options.html))
     {

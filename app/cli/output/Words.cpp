@@ -1,9 +1,9 @@
 #include "Words.h"
 
 #include "CFailure.h"
-#include "COptions.h"
 #include "CReport.h"
 #include "FailureWords.h"
+#include "ShellOptions.h"
 #include "Text.h"
 
 #include <cstdio>
@@ -23,13 +23,13 @@ bool Refuse(std::string_view words)
     return false;
 }
 
-void SayWord(const COptions& options, std::string_view words)
+void SayWord(const ShellOptions& options, std::string_view words)
 {
     if (!options.quiet)
         SayError(words);
 }
 
-void SayReport(const COptions& options, const CReport& report)
+void SayReport(const ShellOptions& options, const CReport& report)
 {
     if (report.warning)
         SayWord(options, "warning: " + ReportLine(report));
@@ -51,7 +51,7 @@ void SayFailure(const std::string& path, const CFailure& failure)
     SayError(ReportLine(MakeReport(path, failure, false)));
 }
 
-void SayWarnings(const COptions& options, const std::string& path, const CFailureRecord& record)
+void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record)
 {
     for (const CFailure& warning : record.Warnings())
         SayReport(options, MakeReport(path, warning, true));

@@ -13,49 +13,49 @@
 
 namespace gw {
 
-EBatchJob BatchJobOf(const COptions& options)
+EBatchJob BatchJobOf(const ShellOptions& options)
 {
     return options.job == "htr" ? EBatchJob::ToMotion : EBatchJob::ToContainer;
 }
 
-CBatchRun::CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellConversion& conversion,
+CBatchRun::CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
                      CShellReports& reports)
-    : CFileRun(options, std::move(jobs), std::move(state)), m_kConversion(conversion), m_kOwnReports(reports)
+    : CFileRun(options, std::move(jobs), std::move(state)), conversion_(conversion), ownReports_(reports)
 {
 }
 
 // The profile is read from its file again for every source, unless it was adapted, which no file has.
-EBatchStep CBatchRun::ConvertMotion(const CConversionJob& job)
+EBatchStep CBatchRun::ConvertMotion(const ConversionJob& job)
 {
-    if (!m_kConversion.LoadSource(job.source))
+    if (!conversion_.LoadSource(job.source))
         return EBatchStep::Ended;
-    m_kConversion.LoadTarget();
-    if (!m_kConversion.IsAdapted())
-        m_kConversion.RereadProfile();
-    if (!m_kConversion.Convert(true))
+    conversion_.LoadTarget();
+    if (!conversion_.IsAdapted())
+        conversion_.RereadProfile();
+    if (!conversion_.Convert(true))
         return EBatchStep::Abandoned;
-    return m_kConversion.WriteBatchResult(job.output) ? EBatchStep::Done : EBatchStep::Ended;
+    return conversion_.WriteBatchResult(job.output) ? EBatchStep::Done : EBatchStep::Ended;
 }
 
-EBatchStep CBatchRun::RunJob(const CConversionJob& job)
+EBatchStep CBatchRun::RunJob(const ConversionJob& job)
 {
     if (BatchJobOf(Options()) == EBatchJob::ToMotion)
         return ConvertMotion(job);
     CFailureRecord record;
     const bool packaged = PackageMotionFile(job.source, job.output, record);
-    m_kConversion.Report(job.source, record);
+    conversion_.Report(job.source, record);
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 
 // A file of which a failure is told counts as failed, and ends the run only where the desktop program's ends.
-CFileRun::CFileEnd CBatchRun::Convert(const COptions& options, size_t index, std::FILE* record)
+CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
-    const CConversionJob& job = AllJobs()[index];
+    const ConversionJob& job = AllJobs()[index];
     SayWord(Options(), Printable(job.source) + " (" + std::to_string(index + 1) + " of " +
                            std::to_string(AllJobs().size()) + ')');
-    const size_t before = m_kOwnReports.All().size();
+    const size_t before = ownReports_.All().size();
     const EBatchStep step = RunJob(job);
-    const auto reports = std::span(m_kOwnReports.All()).subspan(before);
+    const auto reports = std::span(ownReports_.All()).subspan(before);
     const bool good = step == EBatchStep::Done && std::ranges::all_of(reports, &CReport::warning);
     const EConversion outcome = good ? EConversion::Converted : EConversion::Failed;
     WriteRecord(index, outcome, reports, record);
@@ -72,9 +72,9 @@ void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const C
     json.Key("source").Text(AllJobs()[index].source);
     json.Key("output").Text(AllJobs()[index].output);
     json.Key("outcome").Text(OutcomeName(outcome));
-    json.Key("profile").Text(converts ? m_kConversion.Profile().name : "");
-    json.Key("profilePath").Text(converts ? m_kConversion.ProfilePath() : "");
-    json.Key("frames").Integer(converts ? m_kConversion.Result().GetKeyCount() : 0);
+    json.Key("profile").Text(converts ? conversion_.Profile().name : "");
+    json.Key("profilePath").Text(converts ? conversion_.ProfilePath() : "");
+    json.Key("frames").Integer(converts ? conversion_.Result().GetKeyCount() : 0);
     WriteReports(json, {reports.begin(), reports.end()});
     json.EndObject();
     json.EndDocument();
@@ -94,9 +94,9 @@ void CBatchRun::TellUpToDate(size_t index)
 bool CBatchRun::AddProfiles(CContentHash& key)
 {
     if (BatchJobOf(Options()) == EBatchJob::ToMotion)
-        key.AddFile(m_kConversion.ProfilePath());
-    if (m_kConversion.IsAdapted())
-        key.AddText(TextOf(m_kConversion.Profile()));
+        key.AddFile(conversion_.ProfilePath());
+    if (conversion_.IsAdapted())
+        key.AddText(TextOf(conversion_.Profile()));
     return true;
 }
 
@@ -112,7 +112,7 @@ bool CBatchRun::TellEnd()
     const int message = BatchJobOf(Options()) == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage;
     const std::string count[] = {std::to_string(Tally()[EConversion::Converted])};
     if (!IsAbandoned())
-        SayWord(Options(), FormatText(m_kConversion.Message(message), count));
+        SayWord(Options(), FormatText(conversion_.Message(message), count));
     return good;
 }
 

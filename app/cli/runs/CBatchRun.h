@@ -17,7 +17,7 @@ class CBatchRun : public CFileRun
 {
 public:
     /// Conversion and reports must outlive the run, and so must the options.
-    CBatchRun(const COptions& options, Jobs jobs, CRunState state, CShellConversion& conversion,
+    CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
               CShellReports& reports);
 
     /// Everything that was reported of the files, in order.
@@ -26,7 +26,7 @@ public:
     size_t TakenCount() const { return m_uiTaken; }
 
 protected:
-    CFileEnd Convert(const COptions& options, size_t index, std::FILE* record) override;
+    FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) override;
     void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
     void TellUpToDate(size_t index) override;
     bool AddProfiles(CContentHash& key) override;
@@ -35,17 +35,17 @@ protected:
     bool TellEnd() override;
 
 private:
-    EBatchStep RunJob(const CConversionJob& job);
-    EBatchStep ConvertMotion(const CConversionJob& job);
+    EBatchStep RunJob(const ConversionJob& job);
+    EBatchStep ConvertMotion(const ConversionJob& job);
     void WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports, std::FILE* record);
 
-    CShellConversion& m_kConversion;
-    CShellReports& m_kOwnReports; ///< of this process
+    CShellConversion& conversion_;
+    CShellReports& ownReports_; ///< of this process
     std::vector<CReport> m_kReports;
     size_t m_uiTaken = 0;
 };
 
 /// What the option --job asks for.
-EBatchJob BatchJobOf(const COptions& options);
+EBatchJob BatchJobOf(const ShellOptions& options);
 
 } // namespace gw

@@ -20,7 +20,7 @@ std::string OutcomeWords(EConversion outcome)
 
 } // namespace
 
-CFileRun::CFileEnd CConversionRun::Convert(const COptions& options, size_t index, std::FILE* record)
+CFileRun::FileEnd CConversionRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     CPagePart part(index + 1, AllJobs().size());
     const EConversion outcome =
@@ -50,7 +50,7 @@ bool CConversionRun::AddProfiles(CContentHash& key)
         key.AddFile(path);
         return !path.empty();
     }
-    for (const CInstalledProfile& profile : conversion.InstalledProfiles())
+    for (const InstalledProfile& profile : conversion.InstalledProfiles())
         key.AddText(profile.name).AddFile(profile.path);
     return true;
 }

@@ -12,7 +12,7 @@ public:
     using CFileRun::CFileRun;
 
 protected:
-    CFileEnd Convert(const COptions& options, size_t index, std::FILE* record) override;
+    FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) override;
     void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
     void TellUpToDate(size_t index) override;
     bool AddProfiles(CContentHash& key) override;

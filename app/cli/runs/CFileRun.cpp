@@ -34,14 +34,14 @@ constexpr uint8_t kEndsRun = 0x80;
 constexpr uint8_t kAbandons = 0x40;
 constexpr uint8_t kOutcomeBits = 0x0f;
 
-size_t WorkerCount(const COptions& options, size_t jobCount)
+size_t WorkerCount(const ShellOptions& options, size_t jobCount)
 {
     const size_t cores = std::max(1u, std::thread::hardware_concurrency());
     return std::min(options.jobs ? static_cast<size_t>(*options.jobs) : cores, jobCount);
 }
 
 // The members of a record that are the run's to say; what follows stays the same from run to run.
-std::string RecordHead(const CConversionJob& job)
+std::string RecordHead(const ConversionJob& job)
 {
     CTextFile text;
     {
@@ -62,13 +62,13 @@ std::string Timed(std::string record, double seconds)
     return record + ",\"seconds\":" + std::string(&digits[0], end);
 }
 
-CReport LostReport(const CConversionJob& job, const CJobEnd& end, float limit)
+CReport LostReport(const ConversionJob& job, const JobEnd& end, float limit)
 {
-    if (end.kind == CJobEnd::EKind::TimedOut)
+    if (end.kind == JobEnd::EKind::TimedOut)
         return ShellFailure(job.source, "time-limit",
                             "not done within " + std::to_string(static_cast<int64_t>(limit)) +
                                 " seconds, so it was stopped; use --time-limit to allow more");
-    if (end.kind == CJobEnd::EKind::Ran)
+    if (end.kind == JobEnd::EKind::Ran)
         return ShellFailure(job.source, "no-record",
                             "the messages about it cannot be stored (is there a limit on the size of "
                             "files?)");
@@ -85,8 +85,8 @@ void Emit(const std::string& text, std::FILE* file)
 
 } // namespace
 
-CFileRun::CFileRun(const COptions& options, Jobs jobs, CRunState state)
-    : m_kOptions(options), m_kJobs(std::move(jobs)), m_kState(std::move(state)),
+CFileRun::CFileRun(const ShellOptions& options, Jobs jobs, RunState state)
+    : options_(options), m_kJobs(std::move(jobs)), m_kState(std::move(state)),
       m_kBar(m_kJobs.size(), !options.quiet && !options.json)
 {
 }
@@ -97,9 +97,9 @@ EExit CFileRun::RunAll()
 {
     if (!Open())
         return EExit::Failed;
-    const CPoolSettings settings{.workerCount = WorkerCount(m_kOptions, m_kJobs.size()),
-                                 .jobSeconds = m_kOptions.timeLimit,
-                                 .commit = m_kOptions.keepGoing ? ECommit::AtOnce : ECommit::InTurn};
+    const PoolSettings settings{.workerCount = WorkerCount(options_, m_kJobs.size()),
+                                .jobSeconds = options_.timeLimit,
+                                .commit = options_.keepGoing ? ECommit::AtOnce : ECommit::InTurn};
     const CInterrupt interrupt;
     const bool ran = CWorkerPool(*this, settings).Run(m_kJobs.size(), interrupt);
     m_kBar.Clear();
@@ -108,58 +108,59 @@ EExit CFileRun::RunAll()
 
 bool CFileRun::Open()
 {
-    if (m_kOptions.resume && !OpenState())
+    if (options_.resume && !OpenState())
         return false;
-    if (!m_kOptions.dryRun && !OpenReport()) // last, because it empties what was there
+    if (!options_.dryRun && !OpenReport()) // last, because it empties what was there
         return false;
-    if (!m_kOptions.dryRun)
+    if (!options_.dryRun)
         SweepLeftovers();
     return true;
 }
 
 bool CFileRun::OpenReport()
 {
-    if (m_kOptions.report.empty())
+    if (options_.report.empty())
         return true;
     if (const std::optional<CReport> refusal = WhyNotReport())
     {
-        SayReport(m_kOptions, *refusal);
+        SayReport(options_, *refusal);
         return false;
     }
-    if (m_kReport.Open(m_kOptions.report, CReportFile::EStart::Empty))
+    if (m_kReport.Open(options_.report, CReportFile::EStart::Empty))
         return true;
-    SayError(Printable(m_kOptions.report) + ": the report cannot be written");
+    SayError(Printable(options_.report) + ": the report cannot be written");
     return false;
 }
 
 std::optional<CReport> CFileRun::WhyNotReport() const
 {
-    const std::string& path = m_kOptions.report;
+    const std::string& path = options_.report;
     const auto isReport = [&](const std::string& other) { return IsSameFile(path, other); };
-    if (std::ranges::any_of(m_kJobs, isReport, &CConversionJob::source) ||
-        std::ranges::any_of(m_kJobs, isReport, &CConversionJob::output) || isReport(m_kOptions.filesFrom) ||
-        isReport(m_kOptions.html) || isReport(m_kOptions.profile))
+    if (std::ranges::any_of(m_kJobs, isReport, &ConversionJob::source) ||
+        std::ranges::any_of(m_kJobs, isReport, &ConversionJob::output) || isReport(options_.filesFrom) ||
+        isReport(options_.html) || isReport(options_.profile))
         return ShellFailure(path, "in-use",
                             "the run reads or writes this file; choose another file for the report");
-    if (m_kOptions.resume && CReportFile::IsReport(path))
+    if (options_.resume && CReportFile::IsReport(path))
         return std::nullopt; // it says again what the first one said
-    return WhyNotWrite(m_kOptions, path);
+    return WhyNotWrite(options_, path);
 }
 
 bool CFileRun::OpenState()
 {
-    const CFilePlatform platform(EPlatformWriting::No, m_kOptions.dataFolder);
+    const CFilePlatform platform(EPlatformWriting::No, options_.dataFolder);
     CContentHash key;
-    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(m_kOptions, ~(kHowToRun | kProfile)));
+    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(options_, ~(kHowToRun | kProfile)));
     for (const char* file : {"base.htr", "KsBone.bsm"})
         key.AddFile(platform.DataFolder() + file);
     if (!AddProfiles(key)) // by what is in them, and not by a name
         return false;
     m_kCommonKey = key.Digits();
     m_kResume.Read(m_kState.folder);
-    if (m_kOptions.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
+    if (options_.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
         return true;
-    SayError(Printable(m_kState.folder) + ": the records of the run cannot be written here, so --resume cannot work");
+    SayError(Printable(m_kState.folder) +
+             ": the records of the run cannot be written here, so --resume cannot work");
     return false;
 }
 
@@ -167,7 +168,7 @@ bool CFileRun::OpenState()
 void CFileRun::SweepLeftovers() const
 {
     std::set<std::string> folders;
-    for (const CConversionJob& job : m_kJobs)
+    for (const ConversionJob& job : m_kJobs)
         folders.insert(FolderOf(job.output));
     for (const std::string& folder : folders)
         RemoveLeftovers(folder);
@@ -183,7 +184,7 @@ EExit CFileRun::Finish(bool ran, int requests)
     const bool isSynced = SyncResults();
     const bool good = TellEnd() && isSynced;
     if (m_bReportFailed)
-        SayError(Printable(m_kOptions.report) + ": the end of the report cannot be written");
+        SayError(Printable(options_.report) + ": the end of the report cannot be written");
     if (requests > 0)
         return EExit::Interrupted;
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
@@ -192,7 +193,7 @@ EExit CFileRun::Finish(bool ran, int requests)
 // Before anything says that the run is done. A run of one file has synced it already.
 bool CFileRun::SyncResults()
 {
-    if (m_kOptions.resume && m_kResume.HasUnsynced())
+    if (options_.resume && m_kResume.HasUnsynced())
         m_kSync.Add(m_kState.folder.empty() ? "." : m_kState.folder);
     const std::string failed = m_kSync.Sync();
     const bool isSynced = failed.empty();
@@ -201,7 +202,7 @@ bool CFileRun::SyncResults()
                  ": the disk reports a failed write; this result or others of the run may be "
                  "damaged");
     const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
-    if (isSynced && isNews && m_kOptions.resume && !m_kOptions.dryRun)
+    if (isSynced && isNews && options_.resume && !options_.dryRun)
         m_kResume.AddSynced();
     return isSynced;
 }
@@ -210,23 +211,22 @@ bool CFileRun::SyncResults()
 
 uint8_t CFileRun::Run(size_t index, std::FILE* record)
 {
-    const CConversionJob& job = m_kJobs[index];
+    const ConversionJob& job = m_kJobs[index];
     CSafeFile::DeferSyncs(IsSyncDeferred());
-    if (!m_kOptions.dryRun)
+    if (!options_.dryRun)
         CreateFolder(FolderOf(job.output));
     std::string line;
-    const CFileEnd end =
-        m_kOptions.resume ? ConvertResumed(index, line) : ConvertGuarded(m_kOptions, index, line);
+    const FileEnd end = options_.resume ? ConvertResumed(index, line) : ConvertGuarded(options_, index, line);
     Emit(line + "}\n" + Enclosure(), record);
     return static_cast<uint8_t>(static_cast<uint8_t>(end.outcome) | (end.endsRun ? kEndsRun : 0) |
                                 (end.abandons ? kAbandons : 0));
 }
 
-CFileRun::CFileEnd CFileRun::ConvertGuarded(const COptions& options, size_t index, std::string& line)
+CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t index, std::string& line)
 {
     const auto start = std::chrono::steady_clock::now();
     CTextFile text;
-    CFileEnd end{.endsRun = !options.keepGoing};
+    FileEnd end{.endsRun = !options.keepGoing};
     try
     {
         if (FolderExists(m_kJobs[index].source)) // in a tree, what cannot be listed stands for its files
@@ -243,9 +243,9 @@ CFileRun::CFileEnd CFileRun::ConvertGuarded(const COptions& options, size_t inde
     return end;
 }
 
-CFileRun::CFileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
+CFileRun::FileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
 {
-    const CConversionJob& job = m_kJobs[index];
+    const ConversionJob& job = m_kJobs[index];
     const std::string name = NameInState(job);
     const std::string key = KeyOf(job);
     const std::string head = RecordHead(job);
@@ -256,47 +256,48 @@ CFileRun::CFileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
         line = head + *told + ",\"resumed\":true";
         return {.outcome = EConversion::Skipped};
     }
-    COptions options = m_kOptions;
+    ShellOptions options = options_;
     if (!options.force && m_kResume.Knows(name) && FileExists(job.output))
     {
         if (!m_kResume.IsOwn(name, digits, ModificationDigits(job.output)))
             return KeepChanged(index, line);
         options.force = true;
     }
-    const CFileEnd end = ConvertGuarded(options, index, line);
+    const FileEnd end = ConvertGuarded(options, index, line);
     if (end.outcome == EConversion::Converted)
         m_kResume.AddMade(name, key, m_kReadyDigits, m_kReadyModified,
                           line.substr(std::min(head.size(), line.size())));
     return end;
 }
 
-CFileRun::CFileEnd CFileRun::KeepChanged(size_t index, std::string& line)
+CFileRun::FileEnd CFileRun::KeepChanged(size_t index, std::string& line)
 {
     CTextFile text;
-    TellLost(index,
-             ShellFailure(m_kJobs[index].output, "changed",
-                          "this file was changed after the run wrote it, so it was kept; --force replaces it"),
-             text.File());
+    TellLost(
+        index,
+        ShellFailure(m_kJobs[index].output, "changed",
+                     "this file was changed after the run wrote it, so it was kept; --force replaces it"),
+        text.File());
     line = Timed(text.Text(), 0.0);
-    return {.endsRun = !m_kOptions.keepGoing};
+    return {.endsRun = !options_.keepGoing};
 }
 
 void CFileRun::Ready(size_t index, const std::string& privatePath)
 {
-    if (!m_kOptions.resume)
+    if (!options_.resume)
         return;
     m_kReadyDigits = FileDigits(privatePath);
     m_kReadyModified = ModificationDigits(privatePath);
     m_kResume.AddReady(NameInState(m_kJobs[index]), m_kReadyDigits, m_kReadyModified);
 }
 
-std::string CFileRun::KeyOf(const CConversionJob& job) const
+std::string CFileRun::KeyOf(const ConversionJob& job) const
 {
     return CContentHash().AddText(m_kCommonKey).AddText(NameInState(job)).AddFile(job.source).Digits();
 }
 
 // The same from wherever the run is started.
-std::string CFileRun::NameInState(const CConversionJob& job) const
+std::string CFileRun::NameInState(const ConversionJob& job) const
 {
     return job.output.starts_with(m_kState.folder) ? job.output.substr(m_kState.folder.size()) : job.output;
 }
@@ -308,12 +309,12 @@ void CFileRun::Lost(size_t index)
     RemoveLeftovers(FolderOf(m_kJobs[index].output));
 }
 
-bool CFileRun::Take(size_t index, const CJobEnd& end)
+bool CFileRun::Take(size_t index, const JobEnd& end)
 {
     m_kBar.Clear();
     Emit(end.words, stderr);
     Emit(end.output, stdout);
-    const bool lost = end.kind != CJobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
+    const bool lost = end.kind != JobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
     const std::string record = lost ? TakeLost(index, end) : end.record;
     std::fflush(stdout);
     const auto outcome = lost ? EConversion::Failed : static_cast<EConversion>(end.answer & kOutcomeBits);
@@ -326,13 +327,13 @@ bool CFileRun::Take(size_t index, const CJobEnd& end)
     NextLine(enclosure, line);
     AddToReport(line);
     TakeRecord(index, outcome, line, enclosure);
-    return lost ? m_kOptions.keepGoing : (end.answer & kEndsRun) == 0;
+    return lost ? options_.keepGoing : (end.answer & kEndsRun) == 0;
 }
 
-std::string CFileRun::TakeLost(size_t index, const CJobEnd& end)
+std::string CFileRun::TakeLost(size_t index, const JobEnd& end)
 {
     CTextFile text;
-    TellLost(index, LostReport(m_kJobs[index], end, m_kOptions.timeLimit), text.File());
+    TellLost(index, LostReport(m_kJobs[index], end, options_.timeLimit), text.File());
     return Timed(text.Text(), end.seconds) + "}\n";
 }
 

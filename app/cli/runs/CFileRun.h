@@ -19,7 +19,7 @@ class CContentHash;
 struct CReport;
 
 /// Where a run keeps what the next one is to know.
-struct CRunState
+struct RunState
 {
     std::string folder;       ///< with its separator at the end, or empty for the present one
     std::string name = "run"; ///< of several runs into one folder each has its own
@@ -31,25 +31,25 @@ struct CRunState
 class CFileRun : public CJobHandler
 {
 public:
-    using Jobs = std::vector<CConversionJob>;
+    using Jobs = std::vector<ConversionJob>;
 
     /// The options must outlive the run.
-    CFileRun(const COptions& options, Jobs jobs, CRunState state);
+    CFileRun(const ShellOptions& options, Jobs jobs, RunState state);
     ~CFileRun() override;
 
     /// Converts all. Says why where it cannot begin, and what is left.
     EExit RunAll();
-    const CRunTally& Tally() const { return m_kTally; }
+    const RunTally& Tally() const { return m_kTally; }
 
     uint8_t Run(size_t job, std::FILE* record) final;
     void Ready(size_t job, const std::string& privatePath) final;
     void Lost(size_t job) final;
-    bool Take(size_t job, const CJobEnd& end) final;
+    bool Take(size_t job, const JobEnd& end) final;
     void Tick(size_t ended) final;
 
 protected:
     /// How a conversion ended, in a worker; goes to the program as a number.
-    struct CFileEnd
+    struct FileEnd
     {
         EConversion outcome = EConversion::Failed;
         bool endsRun = false;  ///< as the rules of the command say
@@ -57,7 +57,7 @@ protected:
     };
 
     /// Converts one source, in a worker.
-    virtual CFileEnd Convert(const COptions& options, size_t index, std::FILE* record) = 0;
+    virtual FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) = 0;
     /// Tells a failure that the conversion could not tell itself. In a worker, or in the program.
     virtual void TellLost(size_t index, const CReport& reason, std::FILE* record) = 0;
     /// Tells that an output stands as an earlier run made it. In a worker.
@@ -71,7 +71,7 @@ protected:
     /// Closing words. Whether all was well.
     virtual bool TellEnd() = 0;
 
-    const COptions& Options() const { return m_kOptions; }
+    const ShellOptions& Options() const { return options_; }
     const Jobs& AllJobs() const { return m_kJobs; }
     bool IsAbandoned() const { return m_bAbandoned; }
 
@@ -84,17 +84,17 @@ private:
     bool SyncResults();
     void SweepLeftovers() const;
     EExit Finish(bool ran, int requests);
-    CFileEnd ConvertGuarded(const COptions& options, size_t index, std::string& line);
-    CFileEnd ConvertResumed(size_t index, std::string& line);
-    CFileEnd KeepChanged(size_t index, std::string& line);
-    std::string KeyOf(const CConversionJob& job) const;
-    std::string NameInState(const CConversionJob& job) const;
-    std::string TakeLost(size_t index, const CJobEnd& end);
+    FileEnd ConvertGuarded(const ShellOptions& options, size_t index, std::string& line);
+    FileEnd ConvertResumed(size_t index, std::string& line);
+    FileEnd KeepChanged(size_t index, std::string& line);
+    std::string KeyOf(const ConversionJob& job) const;
+    std::string NameInState(const ConversionJob& job) const;
+    std::string TakeLost(size_t index, const JobEnd& end);
     void AddToReport(std::string_view line);
 
-    const COptions& m_kOptions;
+    const ShellOptions& options_;
     Jobs m_kJobs;
-    CRunState m_kState;
+    RunState m_kState;
     CResumeState m_kResume;
     std::string m_kCommonKey;     ///< of everything but the source
     std::string m_kReadyDigits;   ///< of the job's result, in a worker
@@ -102,7 +102,7 @@ private:
     CReportFile m_kReport;
     CDeferredSync m_kSync;
     CProgressBar m_kBar;
-    CRunTally m_kTally;
+    RunTally m_kTally;
     bool m_bAbandoned = false;
     bool m_bReportFailed = false;
 };

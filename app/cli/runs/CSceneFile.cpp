@@ -54,10 +54,10 @@ std::vector<CObject*> CSceneFile::Roots() const
 }
 
 // Not by FindObjects: in a scene with shared nodes that would tell a node once per place.
-std::vector<CFoundNode> CSceneFile::Nodes() const
+std::vector<FoundNode> CSceneFile::Nodes() const
 {
-    std::vector<CFoundNode> found;
-    std::vector<CFoundNode> open;
+    std::vector<FoundNode> found;
+    std::vector<FoundNode> open;
     std::unordered_set<const CNode*> seen;
     const std::vector<CObject*> roots = Roots();
     for (auto root = roots.rbegin(); root != roots.rend(); ++root)
@@ -67,7 +67,7 @@ std::vector<CFoundNode> CSceneFile::Nodes() const
     }
     while (!open.empty())
     {
-        const CFoundNode next = open.back();
+        const FoundNode next = open.back();
         open.pop_back();
         if (!seen.insert(next.node).second)
             continue;

@@ -13,7 +13,7 @@ namespace gw {
 class CKeyframeControl;
 
 /// A node as a walk finds it, with the node above it or null.
-struct CFoundNode
+struct FoundNode
 {
     CNode* node;
     CNode* parent;
@@ -40,7 +40,7 @@ public:
     COrrinStream& Scene() { return m_kScene; }
 
     /// All nodes that hang under the roots, depth first, each at the first of its places.
-    std::vector<CFoundNode> Nodes() const;
+    std::vector<FoundNode> Nodes() const;
     /// The first track, whose clock counts for the whole file; null where there is none.
     const CKeyframeControl* FirstTrack();
     /// The time at which the first track reaches a frame.

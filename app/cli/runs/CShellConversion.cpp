@@ -1,6 +1,5 @@
 #include "CShellConversion.h"
 
-#include "COptions.h"
 #include "CShellReports.h"
 #include "DoubtWords.h"
 #include "FailureWords.h"
@@ -9,6 +8,7 @@
 #include "ProfileChoice.h"
 #include "ProfileFile.h"
 #include "ProfileFit.h"
+#include "ShellOptions.h"
 #include "StringTable.h"
 #include "Text.h"
 #include "Words.h"
@@ -24,16 +24,16 @@ namespace {
 // The stock profiles of old, the one that is asked first.
 constexpr const char* kLongKnown[] = {"PoserBVH.prf", "MaxBVH.prf"};
 
-std::vector<std::string> NamesOf(const std::vector<CInstalledProfile>& profiles)
+std::vector<std::string> NamesOf(const std::vector<InstalledProfile>& profiles)
 {
     std::vector<std::string> names;
     names.reserve(profiles.size());
-    for (const CInstalledProfile& profile : profiles)
+    for (const InstalledProfile& profile : profiles)
         names.push_back(profile.name);
     return names;
 }
 
-CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfile>& profiles)
+CReport NotInstalled(const std::string& name, const std::vector<InstalledProfile>& profiles)
 {
     const std::string nearest = NearestName(name, NamesOf(profiles));
     const std::string guess = nearest.empty() ? "" : "; did you mean " + Quoted(nearest) + '?';
@@ -44,10 +44,10 @@ CReport NotInstalled(const std::string& name, const std::vector<CInstalledProfil
 
 } // namespace
 
-CShellConversion::CShellConversion(const COptions& options, const ConversionChoices& choices,
+CShellConversion::CShellConversion(const ShellOptions& options, const ConversionChoices& choices,
                                    CShellReports& reports)
     : CFileConversion(options.dataFolder, choices, [&](const CReport& report) { reports.Add(report); }),
-      m_kOptions(options), m_kReports(reports)
+      options_(options), reports_(reports)
 {
 }
 
@@ -55,9 +55,9 @@ bool CShellConversion::Open(const std::string& path)
 {
     if (!LoadSource(path) || !LoadTarget())
         return false;
-    if (m_kOptions.profile.empty())
+    if (options_.profile.empty())
         PickStockProfile();
-    return !m_kReports.HasFailed();
+    return !reports_.HasFailed();
 }
 
 // The first stock profile that fits.
@@ -81,32 +81,32 @@ void CShellConversion::PickStockProfile()
 
 std::string CShellConversion::FindProfile(const std::string& name)
 {
-    const auto has = [&](const CInstalledProfile& profile) { return EqualNoCase(profile.name, name); };
+    const auto has = [&](const InstalledProfile& profile) { return EqualNoCase(profile.name, name); };
     const auto found = std::ranges::find_if(InstalledProfiles(), has);
-    return found == m_kInstalled->end() ? std::string() : found->path;
+    return found == installed_->end() ? std::string() : found->path;
 }
 
-const std::vector<CInstalledProfile>& CShellConversion::InstalledProfiles()
+const std::vector<InstalledProfile>& CShellConversion::InstalledProfiles()
 {
-    if (!m_kInstalled)
+    if (!installed_)
     {
-        m_kInstalled.emplace();
+        installed_.emplace();
         ReadInstalled(DataFile({}), true);
         ReadInstalled(CustomProfileFolder(Platform(), Message(kCustomFolderKeyMessage)), false);
     }
-    return *m_kInstalled;
+    return *installed_;
 }
 
 // Each name once, with the first profile of that name.
 void CShellConversion::ReadInstalled(const std::string& folder, bool stock)
 {
     std::unordered_set<std::string> names;
-    for (const CInstalledProfile& profile : *m_kInstalled)
+    for (const InstalledProfile& profile : *installed_)
         names.insert(LowerCase(profile.name));
     for (const CProfileTexts::Entry& entry : m_kTexts.emplace_back(folder).Entries())
     {
         if (names.insert(LowerCase(entry.name)).second)
-            m_kInstalled->push_back({entry.name, folder + entry.file, stock, entry.text});
+            installed_->push_back({entry.name, folder + entry.file, stock, entry.text});
     }
 }
 
@@ -128,9 +128,9 @@ std::string CShellConversion::ResolveProfile(const std::string& nameOrFile)
 
 bool CShellConversion::SelectProfile()
 {
-    if (!m_kOptions.profile.empty())
+    if (!options_.profile.empty())
     {
-        const std::string path = ResolveProfile(m_kOptions.profile);
+        const std::string path = ResolveProfile(options_.profile);
         return !path.empty() && UseProfile(path);
     }
     if (ProfilePath().empty())
@@ -142,7 +142,7 @@ bool CShellConversion::SelectProfile()
 std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
 {
     std::vector<LoadedProfile> profiles;
-    for (const CInstalledProfile& profile : InstalledProfiles())
+    for (const InstalledProfile& profile : InstalledProfiles())
     {
         if (profile.text)
             profiles.push_back({profile.path, *profile.text});
@@ -166,10 +166,10 @@ bool CShellConversion::SelectFitting()
     const std::vector<ProfileChoice> choices = Choices(EJudged::First);
     if (!choices.empty() && choices.front().match.IsWhole())
         return Take(choices.front());
-    m_kNearest.emplace();
+    nearest_.emplace();
     if (!choices.empty())
-        Measure(choices.front().path, *m_kNearest);
-    Report(NoneFitsReport(SourcePath(), *m_kNearest));
+        Measure(choices.front().path, *nearest_);
+    Report(NoneFitsReport(SourcePath(), *nearest_));
     return false;
 }
 
@@ -195,7 +195,7 @@ bool CShellConversion::Take(const ProfileChoice& choice)
     }
     for (const CReport& warning : DoubtWarnings(SourcePath(), choice))
         Report(warning);
-    m_kChosen = choice;
+    chosen_ = choice;
     UseProfile(choice.path, choice.profile);
     return true;
 }

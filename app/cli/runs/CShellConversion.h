@@ -14,10 +14,10 @@
 namespace gw {
 
 class CShellReports;
-struct COptions;
+struct ShellOptions;
 
 /// An installed profile.
-struct CInstalledProfile
+struct InstalledProfile
 {
     std::string name;
     std::string path;
@@ -31,13 +31,13 @@ class CShellConversion : public CFileConversion
 {
 public:
     /// Options and reports must outlive the conversion.
-    CShellConversion(const COptions& options, const ConversionChoices& choices, CShellReports& reports);
+    CShellConversion(const ShellOptions& options, const ConversionChoices& choices, CShellReports& reports);
 
     /// Opens a source and loads the target. Where no profile was named takes a stock profile that fits the
     /// source. False, with the reason said, where anything failed.
     bool Open(const std::string& path);
     /// The installed profiles, each name once and with the file that it stands for.
-    const std::vector<CInstalledProfile>& InstalledProfiles();
+    const std::vector<InstalledProfile>& InstalledProfiles();
     /// The file of a profile that is named by its path, which ends in .prf, or by its display name, or by any
     /// other path. Empty, and says why, for none that can be read.
     std::string ResolveProfile(const std::string& nameOrFile);
@@ -48,10 +48,10 @@ public:
     /// it was opened, then by ChooseProfile.
     std::vector<ProfileChoice> Choices(EJudged judged = EJudged::All);
     /// What was chosen; nothing for a profile that was named or is the stock one of old.
-    const std::optional<ProfileChoice>& Chosen() const { return m_kChosen; }
-    bool IsAdapted() const { return m_kChosen && m_kChosen->adapted; }
+    const std::optional<ProfileChoice>& Chosen() const { return chosen_; }
+    bool IsAdapted() const { return chosen_ && chosen_->adapted; }
     /// How far the nearest profile fits, where none did.
-    const std::optional<CProfileFit>& Nearest() const { return m_kNearest; }
+    const std::optional<CProfileFit>& Nearest() const { return nearest_; }
     /// How a profile fits the open source. False when its file cannot be read.
     bool Measure(const std::string& profilePath, CProfileFit& fit) const;
 
@@ -63,12 +63,12 @@ private:
     void WarnOfStockPick() const;
     bool Take(const ProfileChoice& choice);
 
-    const COptions& m_kOptions;
-    const CShellReports& m_kReports;
-    std::deque<CProfileTexts> m_kTexts;                         ///< of the folders of installed profiles
-    std::optional<std::vector<CInstalledProfile>> m_kInstalled; ///< once asked for
-    std::optional<ProfileChoice> m_kChosen;
-    std::optional<CProfileFit> m_kNearest;
+    const ShellOptions& options_;
+    const CShellReports& reports_;
+    std::deque<CProfileTexts> m_kTexts;                      ///< of the folders of installed profiles
+    std::optional<std::vector<InstalledProfile>> installed_; ///< once asked for
+    std::optional<ProfileChoice> chosen_;
+    std::optional<CProfileFit> nearest_;
 };
 
 } // namespace gw

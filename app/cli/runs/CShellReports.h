@@ -7,7 +7,7 @@
 
 namespace gw {
 
-struct COptions;
+struct ShellOptions;
 
 /// What a conversion reports: said on standard error as it comes, and kept, but for the program's fixed
 /// messages, which programs need not be told.
@@ -15,7 +15,7 @@ class CShellReports
 {
 public:
     /// The options must outlive the reports.
-    explicit CShellReports(const COptions& options) : options_(options) {}
+    explicit CShellReports(const ShellOptions& options) : options_(options) {}
 
     void Add(const CReport& report)
     {
@@ -31,7 +31,7 @@ public:
     const std::vector<CReport>& All() const { return reports_; }
 
 private:
-    const COptions& options_;
+    const ShellOptions& options_;
     std::vector<CReport> reports_;
     bool hasFailed_ = false;
 };

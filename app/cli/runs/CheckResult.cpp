@@ -2,8 +2,8 @@
 
 #include "CFileConversion.h"
 #include "CKeyframeControl.h"
-#include "COptions.h"
 #include "ConvertFile.h"
+#include "ShellOptions.h"
 #include "Skeleton.h"
 #include "SourceTiming.h"
 
@@ -34,7 +34,7 @@ MotionClip SourceClipOf(const CFileConversion& conversion)
     return {conversion.DrivingRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
 }
 
-ConvertedMotion MotionOf(const CFileConversion& conversion, const CConversionJob& job)
+ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job)
 {
     ConvertedMotion motion;
     motion.source = job.source;
@@ -56,7 +56,7 @@ std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, c
     return measured.sums.frameCount > 0 ? std::optional(std::move(measured)) : std::nullopt;
 }
 
-std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, const CConversionJob& job,
+std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options, const ConversionJob& job,
                                                     const std::string& profilePath)
 {
     if (!options.align && !options.faithful)

@@ -7,15 +7,15 @@
 namespace gw {
 
 class CFileConversion;
-struct CConversionJob;
-struct COptions;
+struct ConversionJob;
+struct ShellOptions;
 
 /// The source of a conversion that is made, as it was read; it moves by the track by which it was converted.
 MotionClip SourceClipOf(const CFileConversion& conversion);
 
 /// The source and the result of a conversion that is made, as clips of trees that live with it; named after
 /// the job. The result is saved already: its tracks take the target's rest pose.
-ConvertedMotion MotionOf(const CFileConversion& conversion, const CConversionJob& job);
+ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job);
 
 /// Compares source and result by the profile that the conversion used. Returns nothing if the profile can no
 /// longer be read or the motion has no frames.
@@ -24,7 +24,7 @@ std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,
 
 /// Converts the job's source once more by the plain rules, without a word, and measures what comes of it.
 /// Nothing where that fails, and where the options ask for the plain rules as it is.
-std::optional<MeasuredConversion> MeasurePlainRules(const COptions& options, const CConversionJob& job,
+std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options, const ConversionJob& job,
                                                     const std::string& profilePath);
 
 } // namespace gw

@@ -13,12 +13,12 @@ constexpr std::string_view kResult = ".Kinetra";
 
 } // namespace
 
-EExit ListConversions(const COptions& options, CFileRun::Jobs& jobs)
+EExit ListConversions(const ShellOptions& options, CFileRun::Jobs& jobs)
 {
-    std::vector<CSource> sources;
+    std::vector<RunSource> sources;
     if (!ListSources(options, kSources, sources))
         return EExit::Failed;
-    for (const CSource& source : sources)
+    for (const RunSource& source : sources)
         jobs.push_back({source.path, OutputOf(options.outputFolder, source, kResult)});
     if (!AreOutputsApart(jobs))
         return EExit::Usage;

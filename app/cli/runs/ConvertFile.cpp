@@ -59,9 +59,9 @@ void KeepUntilExit(CNode* root)
 class CJobSteps
 {
 public:
-    CJobSteps(const COptions& options, const CConversionJob& job, CShellReports& reports, Account& account,
+    CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellReports& reports, Account& account,
               CPagePart* part)
-        : m_kOptions(options), m_kJob(job), m_kReports(reports), m_kAccount(account), m_pkPart(part),
+        : options_(options), job_(job), reports_(reports), account_(account), m_pkPart(part),
           m_kConversion(options, {options.align, options.faithful}, reports)
     {
     }
@@ -69,7 +69,7 @@ public:
     /// For the only conversion of a process.
     void KeepMotionsUntilExit() const
     {
-        if (HasExtension(m_kJob.source, ".orn"))
+        if (HasExtension(job_.source, ".orn"))
             return;
         KeepUntilExit(m_kConversion.SourceRoot());
         KeepUntilExit(m_kConversion.Result().motionRoot.Get());
@@ -77,16 +77,16 @@ public:
 
     EConversion Run()
     {
-        if (!m_kConversion.Open(m_kJob.source) || !SelectProfile() || !m_kConversion.HasFrames() || !MayFit())
+        if (!m_kConversion.Open(job_.source) || !SelectProfile() || !m_kConversion.HasFrames() || !MayFit())
             return EConversion::Failed;
-        if (m_kOptions.dryRun)
+        if (options_.dryRun)
             return EConversion::Planned;
         if (!Convert())
             return EConversion::Failed;
         // Another run may have made it meanwhile, such as the workers of one that was killed.
-        if (m_kOptions.skipExisting && IsTaken(m_kJob.output))
+        if (options_.skipExisting && IsTaken(job_.output))
             return EConversion::Skipped;
-        if (!m_kConversion.WriteResult(m_kJob.output) || m_kReports.HasFailed())
+        if (!m_kConversion.WriteResult(job_.output) || reports_.HasFailed())
             return EConversion::Failed;
         if (IsMeasured())
             Check();
@@ -99,15 +99,15 @@ private:
     // A later run with --resume may have a report.
     bool IsMeasured() const
     {
-        return m_kOptions.check || m_pkPart || !m_kOptions.report.empty() || m_kOptions.resume;
+        return options_.check || m_pkPart || !options_.report.empty() || options_.resume;
     }
     void Check();
     bool MayFit();
 
-    const COptions& m_kOptions;
-    const CConversionJob& m_kJob;
-    CShellReports& m_kReports;
-    Account& m_kAccount;
+    const ShellOptions& options_;
+    const ConversionJob& job_;
+    CShellReports& reports_;
+    Account& account_;
     CPagePart* m_pkPart; // null where no page is asked for
     CShellConversion m_kConversion;
 };
@@ -115,54 +115,54 @@ private:
 bool CJobSteps::SelectProfile()
 {
     const bool selected = m_kConversion.SelectProfile();
-    m_kAccount.misfit = m_kConversion.Nearest();
-    m_kAccount.profile = m_kConversion.Profile().name;
-    m_kAccount.chosen = m_kConversion.Chosen();
-    m_kAccount.profilePath = m_kConversion.ProfilePath();
+    account_.misfit = m_kConversion.Nearest();
+    account_.profile = m_kConversion.Profile().name;
+    account_.chosen = m_kConversion.Chosen();
+    account_.profilePath = m_kConversion.ProfilePath();
     return selected;
 }
 
 bool CJobSteps::MayFit()
 {
-    const std::optional<CReport> refusal = WhyTooLarge(m_kConversion, m_kJob);
+    const std::optional<CReport> refusal = WhyTooLarge(m_kConversion, job_);
     if (refusal)
-        m_kReports.Add(*refusal);
+        reports_.Add(*refusal);
     return !refusal;
 }
 
 bool CJobSteps::Convert()
 {
-    if (!m_kConversion.Convert(!m_kOptions.noLegs))
+    if (!m_kConversion.Convert(!options_.noLegs))
     {
         CProfileFit fit;
         if (!m_kConversion.IsAdapted() && m_kConversion.Measure(m_kConversion.ProfilePath(), fit) &&
             !fit.missing.empty())
-            m_kAccount.misfit = fit;
+            account_.misfit = fit;
         return false;
     }
-    if (m_kReports.HasFailed())
+    if (reports_.HasFailed())
         return false;
-    m_kAccount.frames = m_kConversion.Result().GetKeyCount();
+    account_.frames = m_kConversion.Result().GetKeyCount();
     return m_kConversion.HasFrames();
 }
 
 // The result is saved: a measuring poses both trees.
 void CJobSteps::Check()
 {
-    ConvertedMotion motion = MotionOf(m_kConversion, m_kJob);
-    m_kAccount.check = MeasureMotion(motion, m_kAccount.profilePath);
-    if (!m_kAccount.check)
+    ConvertedMotion motion = MotionOf(m_kConversion, job_);
+    account_.check = MeasureMotion(motion, account_.profilePath);
+    if (!account_.check)
         return;
-    if (m_kOptions.check || m_pkPart)
-        m_kAccount.plainCheck = MeasurePlainRules(m_kOptions, m_kJob, m_kAccount.profilePath);
-    motion.profile = m_kAccount.profile;
-    motion.measured = &*m_kAccount.check;
-    motion.plain = m_kAccount.plainCheck ? &*m_kAccount.plainCheck : nullptr;
+    if (options_.check || m_pkPart)
+        account_.plainCheck = MeasurePlainRules(options_, job_, account_.profilePath);
+    motion.profile = account_.profile;
+    motion.measured = &*account_.check;
+    motion.plain = account_.plainCheck ? &*account_.plainCheck : nullptr;
     if (m_pkPart)
         m_pkPart->Show(motion);
 }
 
-EConversion Decide(const COptions& options, const CConversionJob& job, CShellReports& reports,
+EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShellReports& reports,
                    Account& account, CPagePart* part, EProcess process)
 {
     if (options.skipExisting && IsTaken(job.output))
@@ -209,7 +209,7 @@ std::string ProfileWords(const Account& account)
     return account.chosen ? name + ", " + SurenessName(account.chosen->verdict.sureness) : name;
 }
 
-void Print(const CConversionJob& job, const Account& account)
+void Print(const ConversionJob& job, const Account& account)
 {
     const std::string paths = Printable(job.source) + " -> " + Printable(job.output);
     if (account.outcome == EConversion::Skipped)
@@ -221,7 +221,7 @@ void Print(const CConversionJob& job, const Account& account)
                     ProfileWords(account).c_str());
 }
 
-void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& job, const Account& account,
+void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob& job, const Account& account,
                const CShellReports& reports)
 {
     CJsonWriter json(file);
@@ -249,7 +249,7 @@ void WriteJson(std::FILE* file, const COptions& options, const CConversionJob& j
     json.EndDocument();
 }
 
-void Tell(const COptions& options, const CConversionJob& job, const Account& account,
+void Tell(const ShellOptions& options, const ConversionJob& job, const Account& account,
           const CShellReports& reports, std::FILE* record)
 {
     if (record)
@@ -270,7 +270,7 @@ const char* OutcomeName(EConversion outcome)
     return kOutcomeNames[static_cast<size_t>(outcome)];
 }
 
-EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
+EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process)
 {
     CShellReports reports(options);
@@ -280,14 +280,15 @@ EConversion ConvertFile(const COptions& options, const CConversionJob& job, std:
     return account.outcome;
 }
 
-void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record)
+void TellFailed(const ShellOptions& options, const ConversionJob& job, const CReport& reason,
+                std::FILE* record)
 {
     CShellReports reports(options);
     reports.Add(reason);
     Tell(options, job, {}, reports, record);
 }
 
-void TellSkipped(const COptions& options, const CConversionJob& job, const char* why)
+void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why)
 {
     Account account;
     account.outcome = EConversion::Skipped;

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "COptions.h"
+#include "ShellOptions.h"
 
 #include <cstdint>
 #include <cstdio>
@@ -13,7 +13,7 @@ class CPagePart;
 struct CReport;
 
 /// One source and the file that becomes of it.
-struct CConversionJob
+struct ConversionJob
 {
     std::string source;
     std::string output;
@@ -41,12 +41,13 @@ enum class EProcess : uint8_t
 /// on standard output and everything else on standard error. Nothing of one source stays for the next. A
 /// record, unless it is null, takes what --json tells and the key figures, and a part of a page the
 /// conversion's pictures and figures.
-EConversion ConvertFile(const COptions& options, const CConversionJob& job, std::FILE* record,
+EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process = EProcess::GoesOn);
 
 /// Tells in the same way of a conversion that came to nothing, for a reason that it could not tell itself.
-void TellFailed(const COptions& options, const CConversionJob& job, const CReport& reason, std::FILE* record);
+void TellFailed(const ShellOptions& options, const ConversionJob& job, const CReport& reason,
+                std::FILE* record);
 /// And of one that is not made.
-void TellSkipped(const COptions& options, const CConversionJob& job, const char* why);
+void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why);
 
 } // namespace gw

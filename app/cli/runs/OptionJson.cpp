@@ -19,19 +19,19 @@ concept Plain = std::same_as<T, bool> || std::same_as<T, std::string> || std::sa
 
 struct COptionValue
 {
-    const COptions& options;
+    const ShellOptions& options;
 
     template <Plain T>
-    Json operator()(T COptions::*target) const
+    Json operator()(T ShellOptions::*target) const
     {
-        return options.*target == COptions().*target ? Json() : Json(options.*target);
+        return options.*target == ShellOptions().*target ? Json() : Json(options.*target);
     }
     template <Plain T>
-    Json operator()(std::optional<T> COptions::*target) const
+    Json operator()(std::optional<T> ShellOptions::*target) const
     {
         return options.*target ? Json(*(options.*target)) : Json();
     }
-    Json operator()(CPixelSize COptions::*) const { return {}; }
+    Json operator()(PixelSize ShellOptions::*) const { return {}; }
 };
 
 struct COptionTaker
@@ -39,19 +39,19 @@ struct COptionTaker
     using EKind = CJsonMembers::EKind;
 
     const CJsonMembers::Member& value;
-    COptions& options;
+    ShellOptions& options;
 
     template <Plain T>
-    bool operator()(T COptions::*target) const
+    bool operator()(T ShellOptions::*target) const
     {
         return Take(options.*target);
     }
     template <Plain T>
-    bool operator()(std::optional<T> COptions::*target) const
+    bool operator()(std::optional<T> ShellOptions::*target) const
     {
         return Take((options.*target).emplace());
     }
-    bool operator()(CPixelSize COptions::*) const { return false; }
+    bool operator()(PixelSize ShellOptions::*) const { return false; }
 
     template <Plain T>
     bool Take(T& member) const
@@ -75,17 +75,17 @@ struct COptionTaker
     }
 };
 
-std::string FirstName(const COptionRow& row)
+std::string FirstName(const OptionRow& row)
 {
     return std::string(row.names.substr(0, row.names.find(',')));
 }
 
 } // namespace
 
-std::string OptionsJson(const COptions& options, uint64_t bits)
+std::string OptionsJson(const ShellOptions& options, uint64_t bits)
 {
     CJsonLine json;
-    for (const COptionRow& row : OptionTable())
+    for (const OptionRow& row : OptionTable())
     {
         const Json value = bits & row.bit ? std::visit(COptionValue{options}, row.target) : Json();
         if (!value.is_null())
@@ -94,7 +94,7 @@ std::string OptionsJson(const COptions& options, uint64_t bits)
     return json.Text();
 }
 
-bool ReadOptionsJson(std::string_view text, uint64_t bits, COptions& options, std::string& wrong)
+bool ReadOptionsJson(std::string_view text, uint64_t bits, ShellOptions& options, std::string& wrong)
 {
     CJsonMembers json;
     json.Read(text);
@@ -103,7 +103,7 @@ bool ReadOptionsJson(std::string_view text, uint64_t bits, COptions& options, st
     for (const CJsonMembers::Member& value : json.Members())
     {
         const auto row = std::ranges::find_if(
-            OptionTable(), [&](const COptionRow& r) { return (bits & r.bit) && FirstName(r) == value.key; });
+            OptionTable(), [&](const OptionRow& r) { return (bits & r.bit) && FirstName(r) == value.key; });
         wrong = value.key;
         if (row == OptionTable().end() || !std::visit(COptionTaker{value, options}, row->target))
             return false;

@@ -60,8 +60,8 @@ bool LoadPackagedMotion(const std::string& path, CMotionFile& motion)
 
 bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMotionFile& motion)
 {
-    const CPackageBlocks blocks = FindPackage(scene);
-    CPackageFacts facts;
+    const PackageBlocks blocks = FindPackage(scene);
+    PackageFacts facts;
     if (blocks.file && ReadPackageFacts(*blocks.info, facts))
         return LoadBytes(path, blocks.file->Data(), FormatExtension(facts.format), motion);
     SayFailure(path, {EFailure::Empty, 0, "MotionFile"});

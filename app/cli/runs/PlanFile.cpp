@@ -39,7 +39,7 @@ bool LoadPlan(const std::string& path, CRunPlan& plan)
 
 std::string ShardReport(const std::string& planPath, size_t shard)
 {
-    const CPathParts parts = SplitPath(planPath);
+    const PathParts parts = SplitPath(planPath);
     return parts.folder + parts.stem + ".shard-" + std::to_string(shard) + ".jsonl";
 }
 

@@ -23,7 +23,7 @@ void WriteFit(CJsonWriter& json, const CProfileFit& fit)
     json.Key("found").Integer(fit.foundCount);
     json.Key("drivesRoot").Bool(fit.drivesRoot);
     json.Key("missing").BeginArray();
-    for (const CMissingBone& missing : fit.missing)
+    for (const MissingBone& missing : fit.missing)
     {
         json.BeginObject();
         json.Key("side").Text(SideName(missing.side));

@@ -30,7 +30,7 @@ double NumberBytes(double rowCount)
 
 } // namespace
 
-std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const CConversionJob& job)
+std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job)
 {
     CNode* const skeleton = conversion.Result().restRoot.Get();
     const int rate = conversion.Profile().frameRate;

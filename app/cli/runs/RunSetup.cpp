@@ -15,7 +15,7 @@ constexpr int64_t kWorkerLimit = 1024; // far above the cores of any machine, fa
 
 } // namespace
 
-bool IsRunPossible(const COptions& options)
+bool IsRunPossible(const ShellOptions& options)
 {
     const char* words = nullptr;
     if (options.jobs && (*options.jobs < 1 || *options.jobs > kWorkerLimit))
@@ -36,17 +36,18 @@ bool IsRunPossible(const COptions& options)
 bool AreOutputsApart(const CFileRun::Jobs& jobs)
 {
     std::unordered_set<std::string_view> outputs;
-    for (const CConversionJob& job : jobs)
+    for (const ConversionJob& job : jobs)
     {
         if (outputs.insert(job.output).second)
             continue;
-        SayError(Printable(job.source) + ": another source would also be written to " + Printable(job.output));
+        SayError(Printable(job.source) + ": another source would also be written to " +
+                 Printable(job.output));
         return false;
     }
     return true;
 }
 
-bool MakeOutputFolder(const COptions& options)
+bool MakeOutputFolder(const ShellOptions& options)
 {
     if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
         return true;
@@ -54,9 +55,9 @@ bool MakeOutputFolder(const COptions& options)
     return false;
 }
 
-CRunState StateOf(const COptions& options)
+RunState StateOf(const ShellOptions& options)
 {
-    CRunState state;
+    RunState state;
     if (!options.outputFolder.empty())
         state.folder = WithSeparator(options.outputFolder);
     else if (!options.files.empty())

@@ -7,7 +7,7 @@
 
 namespace gw {
 
-void TellTally(const COptions& options, const CRunTally& tally)
+void TellTally(const ShellOptions& options, const RunTally& tally)
 {
     const size_t converted = tally[EConversion::Converted] + tally[EConversion::Planned];
     const size_t skipped = tally[EConversion::Skipped];

@@ -1,7 +1,7 @@
 #pragma once
 
-#include "COptions.h"
 #include "ConvertFile.h"
+#include "ShellOptions.h"
 
 #include <array>
 #include <cstddef>
@@ -9,7 +9,7 @@
 namespace gw {
 
 /// How many sources of a run came to each end.
-struct CRunTally
+struct RunTally
 {
     std::array<size_t, 4> ended{}; ///< by EConversion
     size_t left = 0;               ///< that the run did not come to
@@ -19,6 +19,6 @@ struct CRunTally
 };
 
 /// The closing words of a run: one line, or one object with --json.
-void TellTally(const COptions& options, const CRunTally& tally);
+void TellTally(const ShellOptions& options, const RunTally& tally);
 
 } // namespace gw

@@ -43,7 +43,7 @@ std::string ReadStandardInput()
     return text;
 }
 
-bool ReadList(const COptions& options, std::vector<std::string>& paths)
+bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
 {
     CMappedFile file;
     const bool isInput = options.filesFrom == "-";
@@ -65,18 +65,18 @@ bool ReadList(const COptions& options, std::vector<std::string>& paths)
 }
 
 // A folder that could not be read stands for the sources in it: converting it fails and says so.
-void AddFolder(const std::string& folder, const std::string& below, const COptions& options,
-               std::span<const std::string_view> extensions, std::vector<CSource>& sources)
+void AddFolder(const std::string& folder, const std::string& below, const ShellOptions& options,
+               std::span<const std::string_view> extensions, std::vector<RunSource>& sources)
 {
-    const CSourceTree tree = WalkFolder(folder, extensions, options.outputFolder);
+    const SourceFolder tree = WalkFolder(folder, extensions, options.outputFolder);
     for (const std::string& file : tree.files)
         sources.push_back({WithSeparator(folder) + file, below + file});
     for (const std::string& unreadable : tree.unreadable)
         sources.push_back({unreadable, below + Joined(Steps(unreadable.substr(folder.size()))) + "folder"});
 }
 
-void AddListed(const std::vector<std::string>& paths, const COptions& options,
-               std::span<const std::string_view> extensions, std::vector<CSource>& sources)
+void AddListed(const std::vector<std::string>& paths, const ShellOptions& options,
+               std::span<const std::string_view> extensions, std::vector<RunSource>& sources)
 {
     std::vector<std::string> common;
     for (size_t i = 0; i < paths.size(); ++i)
@@ -101,12 +101,12 @@ void AddListed(const std::vector<std::string>& paths, const COptions& options,
 
 } // namespace
 
-bool ListSources(const COptions& options, std::span<const std::string_view> extensions,
-                 std::vector<CSource>& sources)
+bool ListSources(const ShellOptions& options, std::span<const std::string_view> extensions,
+                 std::vector<RunSource>& sources)
 {
     for (const std::string& file : options.files)
     {
-        const CPathParts parts = SplitPath(file);
+        const PathParts parts = SplitPath(file);
         if (FolderExists(file))
             AddFolder(file, {}, options, extensions, sources);
         else
@@ -119,9 +119,9 @@ bool ListSources(const COptions& options, std::span<const std::string_view> exte
     return true;
 }
 
-std::string OutputOf(const std::string& folder, const CSource& source, std::string_view extension)
+std::string OutputOf(const std::string& folder, const RunSource& source, std::string_view extension)
 {
-    const CPathParts parts = SplitPath(folder.empty() ? source.path : source.below);
+    const PathParts parts = SplitPath(folder.empty() ? source.path : source.below);
     return WithSeparator(folder) + parts.folder + parts.stem + std::string(extension);
 }
 

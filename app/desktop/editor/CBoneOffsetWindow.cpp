@@ -42,7 +42,7 @@ QString AxisLetter(int axis)
 
 CBoneOffsetWindow::CBoneOffsetWindow(const CGaitConvertContent& content, CBoneOffsetDialog& dialog,
                                      QWidget* owner)
-    : QDialog(owner), m_kDialog(dialog)
+    : QDialog(owner), dialog_(dialog)
 {
     setObjectName(QStringLiteral("boneOffset"));
     setWindowTitle(QStringLiteral("GaitTool (Bone Offset)"));
@@ -81,7 +81,7 @@ CFieldEdit* CBoneOffsetWindow::MakeRotation(int axis)
     auto* const field = new CFieldEdit(this);
     field->setObjectName(QStringLiteral("rotation") + AxisLetter(axis));
     field->setAccessibleName(tr("Rotation around %1 in degrees").arg(AxisLetter(axis)));
-    field->setText(ToQString(m_kDialog.RotationText(axis)));
+    field->setText(ToQString(dialog_.RotationText(axis)));
     field->setAlignment(Qt::AlignRight);
     field->SetOnLeave([=, this] { LeaveRotation(axis); });
     m_pkRotation[static_cast<size_t>(axis)] = field;
@@ -96,7 +96,7 @@ QComboBox* CBoneOffsetWindow::MakeAxis(int axis)
     for (const std::string_view entry : CBoneOffsetDialog::kAxisEntries)
         box->addItem(ToQString(entry));
     connect(box, &QComboBox::activated, this, [=, this](int entry) {
-        m_kDialog.ChooseAxis(axis, entry);
+        dialog_.ChooseAxis(axis, entry);
         ShowAxes();
     });
     m_pkAxis[static_cast<size_t>(axis)] = box;
@@ -132,14 +132,14 @@ void CBoneOffsetWindow::accept()
 void CBoneOffsetWindow::LeaveRotation(int axis)
 {
     CFieldEdit* const field = m_pkRotation[static_cast<size_t>(axis)];
-    m_kDialog.LeaveRotation(axis, ToUtf8(field->text()));
-    field->ShowText(ToQString(m_kDialog.RotationText(axis)));
+    dialog_.LeaveRotation(axis, ToUtf8(field->text()));
+    field->ShowText(ToQString(dialog_.RotationText(axis)));
 }
 
 void CBoneOffsetWindow::ShowAxes()
 {
     for (int axis = 0; axis < kAxisCount; ++axis)
-        m_pkAxis[static_cast<size_t>(axis)]->setCurrentIndex(m_kDialog.AxisEntry(axis));
+        m_pkAxis[static_cast<size_t>(axis)]->setCurrentIndex(dialog_.AxisEntry(axis));
 }
 
 } // namespace gw

@@ -30,7 +30,7 @@ private:
     void LeaveRotation(int axis);
     void ShowAxes();
 
-    CBoneOffsetDialog& m_kDialog;
+    CBoneOffsetDialog& dialog_;
     std::array<CFieldEdit*, kAxisCount> m_pkRotation{};
     std::array<QComboBox*, kAxisCount> m_pkAxis{};
 };

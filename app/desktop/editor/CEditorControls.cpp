@@ -23,15 +23,15 @@ struct ButtonRow
 {
     int id;
     const char* text;
-    bool CProfileButtons::*enabled;
+    bool ProfileButtons::*enabled;
 };
 
 constexpr ButtonRow kButtonRows[] = {
-    {kAddToMapButton,    "Add to Map",   &CProfileButtons::addToMap   },
-    {kBoneOffsetButton,  "Bone Offset",  &CProfileButtons::boneOffset },
-    {kRemoveButton,      "Remove",       &CProfileButtons::remove     },
-    {kRemoveAllButton,   "Remove All",   &CProfileButtons::removeAll  },
-    {kSaveProfileButton, "Save Profile", &CProfileButtons::saveProfile},
+    {kAddToMapButton,    "Add to Map",   &ProfileButtons::addToMap   },
+    {kBoneOffsetButton,  "Bone Offset",  &ProfileButtons::boneOffset },
+    {kRemoveButton,      "Remove",       &ProfileButtons::remove     },
+    {kRemoveAllButton,   "Remove All",   &ProfileButtons::removeAll  },
+    {kSaveProfileButton, "Save Profile", &ProfileButtons::saveProfile},
 };
 
 // Controls that the window has and never shows. The offset that a file gives goes through the fields.

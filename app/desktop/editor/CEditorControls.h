@@ -15,7 +15,7 @@ class CElidedLabel;
 class CFieldEdit;
 class CGaitConvertContent;
 class CMapRowView;
-struct CProfileButtons;
+struct ProfileButtons;
 
 /// The children of the editor's window, laid out; what they do is the window's business. They are made from
 /// top to bottom, which is the order of the Tab key. Names of objects are control ids.
@@ -30,7 +30,7 @@ public:
     struct Button
     {
         int id;
-        bool CProfileButtons::*enabled;
+        bool ProfileButtons::*enabled;
         QPushButton* button;
     };
 

@@ -25,8 +25,8 @@ bool CFieldEdit::event(QEvent* event)
 
 void CFieldEdit::keyPressEvent(QKeyEvent* event)
 {
-    if (event->key() == Qt::Key_Escape && m_kOnEscape)
-        m_kOnEscape();
+    if (event->key() == Qt::Key_Escape && onEscape_)
+        onEscape_();
     else
         QLineEdit::keyPressEvent(event);
 }
@@ -37,8 +37,8 @@ void CFieldEdit::focusOutEvent(QFocusEvent* event)
     if (event->reason() == Qt::PopupFocusReason)
         return;
     setText(text()); // what was left is no typing any more that the undo keys could take back
-    if (m_kOnLeave)
-        m_kOnLeave();
+    if (onLeave_)
+        onLeave_();
 }
 
 } // namespace gw

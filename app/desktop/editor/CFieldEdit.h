@@ -14,9 +14,9 @@ public:
 
     /// Called when the focus goes elsewhere, be it in another window; a menu over the field takes nothing
     /// away.
-    void SetOnLeave(std::function<void()> onLeave) { m_kOnLeave = std::move(onLeave); }
+    void SetOnLeave(std::function<void()> onLeave) { onLeave_ = std::move(onLeave); }
     /// Called at the Escape key, which then goes no further. Without it the key is the window's.
-    void SetOnEscape(std::function<void()> onEscape) { m_kOnEscape = std::move(onEscape); }
+    void SetOnEscape(std::function<void()> onEscape) { onEscape_ = std::move(onEscape); }
     /// Shows a text, and leaves typing and caret alone where it is there already.
     void ShowText(const QString& text);
 
@@ -26,8 +26,8 @@ protected:
     void focusOutEvent(QFocusEvent* event) override;
 
 private:
-    std::function<void()> m_kOnLeave;
-    std::function<void()> m_kOnEscape;
+    std::function<void()> onLeave_;
+    std::function<void()> onEscape_;
 };
 
 } // namespace gw

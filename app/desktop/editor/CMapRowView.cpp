@@ -17,7 +17,7 @@ constexpr int kRowMargin = 6; // pixels above and below a row's text, together
 QStringList Titles(const CGaitConvertContent& content)
 {
     QStringList titles;
-    for (const CMapColumnTitle& column : kMapColumnTitles)
+    for (const MapColumnTitle& column : kMapColumnTitles)
         titles << (column.messageId ? ToQString(content.Message(column.messageId)) : QStringLiteral(" "));
     return titles;
 }
@@ -74,7 +74,7 @@ void CMapRowView::TellSelection(const QItemSelection& rows, bool selected)
     for (const QItemSelectionRange& range : rows)
     {
         for (int row = range.top(); row <= range.bottom(); ++row)
-            m_kCallbacks.m_kSelect(row, selected);
+            m_kCallbacks.select(row, selected);
     }
 }
 
@@ -94,7 +94,7 @@ void CMapRowView::mouseReleaseEvent(QMouseEvent* event)
     QTableView::mouseReleaseEvent(event);
     const QPoint at = event->position().toPoint();
     if (event->button() == Qt::LeftButton)
-        m_kCallbacks.m_kClick((viewport()->rect().contains(at) ? indexAt(at) : currentIndex()).row());
+        m_kCallbacks.click((viewport()->rect().contains(at) ? indexAt(at) : currentIndex()).row());
 }
 
 void CMapRowView::mouseDoubleClickEvent(QMouseEvent* event)
@@ -102,7 +102,7 @@ void CMapRowView::mouseDoubleClickEvent(QMouseEvent* event)
     QTableView::mouseDoubleClickEvent(event);
     const int row = indexAt(event->position().toPoint()).row();
     if (event->button() == Qt::LeftButton && row >= 0)
-        m_kCallbacks.m_kDoubleClick(row);
+        m_kCallbacks.doubleClick(row);
 }
 
 // A selection by keyboard is a click on the row that it ends on: a list that only the mouse can use is none.
@@ -111,7 +111,7 @@ void CMapRowView::keyPressEvent(QKeyEvent* event)
     m_bSelectionChanged = false;
     QTableView::keyPressEvent(event);
     if (m_bSelectionChanged)
-        m_kCallbacks.m_kClick(currentIndex().row());
+        m_kCallbacks.click(currentIndex().row());
 }
 
 void CMapRowView::resizeEvent(QResizeEvent* event)
@@ -119,7 +119,7 @@ void CMapRowView::resizeEvent(QResizeEvent* event)
     QTableView::resizeEvent(event);
     for (int column = 0; column < m_pkModel->columnCount(); ++column)
     {
-        const CMapColumnTitle& title = kMapColumnTitles[column];
+        const MapColumnTitle& title = kMapColumnTitles[column];
         setColumnWidth(column, width() * title.widthNumerator / title.widthDenominator);
     }
 }

@@ -15,9 +15,9 @@ class CMapRowView : public QTableView
 public:
     struct Callbacks
     {
-        std::function<void(int row, bool selected)> m_kSelect; ///< once for each row that changed
-        std::function<void(int row)> m_kClick;                 ///< after the selection; -1 for none
-        std::function<void(int row)> m_kDoubleClick;
+        std::function<void(int row, bool selected)> select; ///< once for each row that changed
+        std::function<void(int row)> click;                 ///< after the selection; -1 for none
+        std::function<void(int row)> doubleClick;
     };
 
     /// The content names the columns.

@@ -28,7 +28,7 @@ constexpr QSize kTemplateSize(720, 640);
 } // namespace
 
 CProfileEditorWindow::CProfileEditorWindow(CGaitConvertContent& content, CPlatform& platform, QWidget* owner)
-    : QDialog(owner), m_kContent(content), m_kPlatform(platform), m_kControls(content, this)
+    : QDialog(owner), content_(content), platform_(platform), m_kControls(content, this)
 {
     setObjectName(QStringLiteral("profileEditor"));
     setWindowTitle(tr("Profile Editor[*]"));
@@ -94,7 +94,7 @@ void CProfileEditorWindow::AddShortcuts()
 
 CProfileEditorDialog& CProfileEditorWindow::Model() const
 {
-    return *m_kContent.ProfileEditor();
+    return *content_.ProfileEditor();
 }
 
 // A message box takes the focus from the field that it was just given to, whose leaving says nothing new.
@@ -149,16 +149,16 @@ void CProfileEditorWindow::SetShown(bool shown)
 
 void CProfileEditorWindow::RestorePlace()
 {
-    if (m_kHiddenAt)
+    if (hiddenAt_)
     {
-        resize(m_kHiddenAt->size());
-        move(m_kHiddenAt->topLeft());
+        resize(hiddenAt_->size());
+        move(hiddenAt_->topLeft());
         return;
     }
     if (std::exchange(m_bPlaced, true))
         return;
     resize(kTemplateSize.expandedTo(minimumSizeHint()));
-    if (const auto place = ReadWindowPlace(m_kPlatform, kPlaceSetting, size()))
+    if (const auto place = ReadWindowPlace(platform_, kPlaceSetting, size()))
         move(*place);
 }
 
@@ -167,8 +167,8 @@ void CProfileEditorWindow::Hide()
     if (!isVisible())
         return;
     if (!isMinimized() && !isMaximized())
-        m_kHiddenAt = QRect(pos(), size());
-    WriteWindowPlace(m_kPlatform, kPlaceSetting, *this);
+        hiddenAt_ = QRect(pos(), size());
+    WriteWindowPlace(platform_, kPlaceSetting, *this);
     hide();
 }
 
@@ -190,7 +190,7 @@ void CProfileEditorWindow::keyPressEvent(QKeyEvent* event)
 
 bool CProfileEditorWindow::RunBoneOffset(CBoneOffsetDialog& dialog)
 {
-    CBoneOffsetWindow window(m_kContent, dialog, isVisible() ? this : parentWidget());
+    CBoneOffsetWindow window(content_, dialog, isVisible() ? this : parentWidget());
     return window.exec() == Accepted;
 }
 

@@ -54,11 +54,10 @@ private:
     void ShowFieldsAndButtons();
     void ShowPair();
 
-    CGaitConvertContent& m_kContent;
-    CPlatform& m_kPlatform;
+    CGaitConvertContent& content_;
+    CPlatform& platform_;
     CEditorControls m_kControls;
-    std::optional<QRect>
-        m_kHiddenAt; ///< top left with the frame, size without; the window manager forgets it
+    std::optional<QRect> hiddenAt_; ///< top left with the frame, size without; the window manager forgets it
     bool m_bPlaced = false;
     bool m_bRedrawQueued = false;
     bool m_bLeavingField = false;

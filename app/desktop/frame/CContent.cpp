@@ -27,12 +27,12 @@ constexpr int kCornerSide = 32;            // pixels of the corner with the icon
 
 } // namespace
 
-CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : QWidget(frame), m_kKeys(keys)
+CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : QWidget(frame), keys_(keys)
 {
     setObjectName(QStringLiteral("face"));
     setAttribute(Qt::WA_StyledBackground);
     setFixedSize(skin.Size());
-    for (const CSkinChild& child : skin.Children())
+    for (const SkinChild& child : skin.Children())
     {
         QWidget* const widget = MakeFaceChild(child, skin, keys, this);
         m_kChildren[child.name] = widget;
@@ -56,7 +56,7 @@ void CContent::Connect(QWidget* child)
     if (auto* button = dynamic_cast<CFaceButton*>(child))
         connect(button, &QPushButton::clicked, this, [this, button] { Click(ToUtf8(button->objectName())); });
     else if (auto* title = dynamic_cast<CTitleLabel*>(child))
-        title->m_kMouseDown = [this](const QPoint& position) { m_kTitleDown(position); };
+        title->mouseDown = [this](const QPoint& position) { titleDown(position); };
     else
         ConnectBar(child);
 }
@@ -67,9 +67,9 @@ void CContent::ConnectBar(QWidget* child)
     if (!bar)
         return;
     const std::string name = ToUtf8(bar->objectName());
-    bar->m_kMouseDown = [this, name] { m_pkLogic->ChildMouseDown(name); };
-    bar->m_kScroll = [this, name](int value) { m_pkLogic->ChildScroll(name, value); };
-    bar->m_kMouseUp = [this, name] { m_pkLogic->ChildMouseUp(name); };
+    bar->mouseDown = [this, name] { m_pkLogic->ChildMouseDown(name); };
+    bar->scroll = [this, name](int value) { m_pkLogic->ChildScroll(name, value); };
+    bar->mouseUp = [this, name] { m_pkLogic->ChildMouseUp(name); };
 }
 
 void CContent::Click(const std::string& child)
@@ -77,7 +77,7 @@ void CContent::Click(const std::string& child)
     if (child == "minimise")
         window()->showMinimized();
     else if (child == "options")
-        m_kOptions(Child<QWidget>(child)->mapToGlobal(QPoint(0, 0)));
+        options(Child<QWidget>(child)->mapToGlobal(QPoint(0, 0)));
     else if (child == "notes")
         ShowNotes();
     else if (m_pkLogic)
@@ -105,12 +105,12 @@ void CContent::mousePressEvent(QMouseEvent* event)
 {
     const QPoint place = event->position().toPoint();
     if (event->button() == Qt::LeftButton && place.x() < kCornerSide && place.y() < kCornerSide)
-        m_kCornerDown(event->globalPosition().toPoint());
+        cornerDown(event->globalPosition().toPoint());
 }
 
 bool CContent::IsKeyDown(EKey key) const
 {
-    return m_kKeys.IsDown(key);
+    return keys_.IsDown(key);
 }
 
 void CContent::Report(const CReport& report)

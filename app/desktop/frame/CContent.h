@@ -37,16 +37,16 @@ public:
     void FrameAll();
 
     /// The mouse went down on the title.
-    std::function<void(const QPoint& globalPosition)> m_kTitleDown;
+    std::function<void(const QPoint& globalPosition)> titleDown;
     /// The mouse went down in the icon's corner.
-    std::function<void(const QPoint& globalPosition)> m_kCornerDown;
+    std::function<void(const QPoint& globalPosition)> cornerDown;
     /// The options were asked for; the place is where their menu opens.
-    std::function<void(const QPoint& globalPosition)> m_kOptions;
+    std::function<void(const QPoint& globalPosition)> options;
 
     EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
-    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
-    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
-    std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
+    std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override;
+    std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override;
     void Report(const CReport& report) override;
     bool ShowsFindings() const override { return true; }
@@ -87,7 +87,7 @@ private:
     void ShowNotes();
     std::string Notes() const;
 
-    const CLeftKeys& m_kKeys;
+    const CLeftKeys& keys_;
     CGaitConvertContent* m_pkLogic = nullptr;
     CProfileEditorWindow* m_pkEditor = nullptr;
     std::map<std::string, QWidget*, std::less<>> m_kChildren;

@@ -43,19 +43,19 @@ void CContent::ShowNotes()
                   Notes(), EDetails::Unfolded);
 }
 
-std::optional<std::string> CContent::AskOpenFile(const CFileDialogSetup& setup)
+std::optional<std::string> CContent::AskOpenFile(const FileDialogSetup& setup)
 {
     const CArrowCursor arrow;
     return RunFileDialog(*this, QFileDialog::AcceptOpen, setup);
 }
 
-std::optional<std::string> CContent::AskSaveFile(const CFileDialogSetup& setup)
+std::optional<std::string> CContent::AskSaveFile(const FileDialogSetup& setup)
 {
     const CArrowCursor arrow;
     return RunFileDialog(*this, QFileDialog::AcceptSave, setup);
 }
 
-std::optional<CFolderChoice> CContent::AskFolder(const CFileDialogSetup& setup)
+std::optional<FolderChoice> CContent::AskFolder(const FileDialogSetup& setup)
 {
     const CArrowCursor arrow;
     return gw::AskFolder(this, setup);

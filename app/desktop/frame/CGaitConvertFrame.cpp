@@ -64,15 +64,15 @@ std::string DroppedPath(const QMimeData& dropped)
 } // namespace
 
 CGaitConvertFrame::CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, CPlatform& platform)
-    : QWidget(nullptr, Qt::Window | Qt::FramelessWindowHint), m_kPlatform(platform),
+    : QWidget(nullptr, Qt::Window | Qt::FramelessWindowHint), platform_(platform),
       m_pkFace(new CContent(skin, keys, this)),
       m_spContent(std::make_unique<CGaitConvertContent>(*m_pkFace, platform)),
       m_kFilter([this] { m_pkFace->PostCloseRequest(); })
 {
     m_pkFace->SetLogic(m_spContent.get());
-    m_pkFace->m_kTitleDown = [this](const QPoint& position) { BeginMove(position); };
-    m_pkFace->m_kCornerDown = [this](const QPoint& position) { OpenCornerMenu(position); };
-    m_pkFace->m_kOptions = [this](const QPoint& place) {
+    m_pkFace->titleDown = [this](const QPoint& position) { BeginMove(position); };
+    m_pkFace->cornerDown = [this](const QPoint& position) { OpenCornerMenu(position); };
+    m_pkFace->options = [this](const QPoint& place) {
         QMenu* const menu = MakeOptionsMenu(*m_spContent, this);
         menu->popup(place - QPoint(0, menu->sizeHint().height()));
     };
@@ -100,7 +100,7 @@ CGaitConvertFrame::~CGaitConvertFrame()
 void CGaitConvertFrame::Place(const QSize& size)
 {
     setFixedSize(size);
-    if (const auto place = ReadWindowPlace(m_kPlatform, kPlaceSetting))
+    if (const auto place = ReadWindowPlace(platform_, kPlaceSetting))
         move(*place);
     else if (const QScreen* screen = QGuiApplication::primaryScreen())
         move(screen->availableGeometry().center() - rect().center());
@@ -151,7 +151,7 @@ void CGaitConvertFrame::closeEvent(QCloseEvent* event)
         event->ignore();
         return;
     }
-    WriteWindowPlace(m_kPlatform, kPlaceSetting, *this);
+    WriteWindowPlace(platform_, kPlaceSetting, *this);
     m_pkEditor->close();
     event->accept();
     QCoreApplication::quit();
@@ -161,21 +161,21 @@ void CGaitConvertFrame::BeginMove(const QPoint& globalPosition)
 {
     if (windowHandle() && windowHandle()->startSystemMove())
         return;
-    m_kGrip = globalPosition - pos();
+    grip_ = globalPosition - pos();
     grabMouse();
 }
 
 void CGaitConvertFrame::mouseMoveEvent(QMouseEvent* event)
 {
-    if (m_kGrip)
-        move(event->globalPosition().toPoint() - *m_kGrip);
+    if (grip_)
+        move(event->globalPosition().toPoint() - *grip_);
 }
 
 void CGaitConvertFrame::mouseReleaseEvent(QMouseEvent*)
 {
-    if (m_kGrip)
+    if (grip_)
         releaseMouse();
-    m_kGrip.reset();
+    grip_.reset();
 }
 
 void CGaitConvertFrame::OpenCornerMenu(const QPoint& globalPosition)

@@ -46,12 +46,12 @@ private:
     void BeginMove(const QPoint& globalPosition);
     void OpenCornerMenu(const QPoint& globalPosition);
 
-    CPlatform& m_kPlatform;
+    CPlatform& platform_;
     CContent* m_pkFace;
     std::unique_ptr<CGaitConvertContent> m_spContent;
     CProfileEditorWindow* m_pkEditor;
     CMessageFilter m_kFilter;
-    std::optional<QPoint> m_kGrip; ///< where the mouse holds the window while it is dragged by hand
+    std::optional<QPoint> grip_; ///< where the mouse holds the window while it is dragged by hand
 };
 
 } // namespace gw

@@ -28,7 +28,7 @@ bool IsAltF4(const QEvent& event)
 
 } // namespace
 
-CMessageFilter::CMessageFilter(std::function<void()> requestClose) : m_kRequestClose(std::move(requestClose))
+CMessageFilter::CMessageFilter(std::function<void()> requestClose) : requestClose_(std::move(requestClose))
 {
     QCoreApplication::instance()->installEventFilter(this);
 }
@@ -49,7 +49,7 @@ bool CMessageFilter::eventFilter(QObject* watched, QEvent* event)
 {
     if (IsAltF4(*event) && !QApplication::activeModalWidget())
     {
-        m_kRequestClose();
+        requestClose_();
         return true;
     }
     if (!watched->isWidgetType() || !IsLeftPress(*event))
@@ -60,7 +60,7 @@ bool CMessageFilter::eventFilter(QObject* watched, QEvent* event)
         return false;
     if (QWidget* menu = QApplication::activePopupWidget())
         menu->close();
-    m_kRequestClose();
+    requestClose_();
     return true;
 }
 

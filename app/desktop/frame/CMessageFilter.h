@@ -23,7 +23,7 @@ public:
 private:
     bool IsCornerAgain(const QPoint& globalPosition) const;
 
-    std::function<void()> m_kRequestClose;
+    std::function<void()> requestClose_;
     QElapsedTimer m_kSinceCorner; ///< invalid where no click is remembered
     QPoint m_kCorner;
 };

@@ -18,8 +18,8 @@ void CPlaybar::GoTo(int x)
     const int wanted =
         QStyle::sliderValueFromPosition(minimum(), maximum(), x - kHandleWidth / 2, width() - kHandleWidth);
     setValue(wanted);
-    if (m_kScroll)
-        m_kScroll(wanted);
+    if (scroll)
+        scroll(wanted);
 }
 
 void CPlaybar::mousePressEvent(QMouseEvent* event)
@@ -27,8 +27,8 @@ void CPlaybar::mousePressEvent(QMouseEvent* event)
     if (event->button() != Qt::LeftButton)
         return;
     setSliderDown(true);
-    if (m_kMouseDown)
-        m_kMouseDown();
+    if (mouseDown)
+        mouseDown();
     GoTo(event->position().toPoint().x());
 }
 
@@ -43,8 +43,8 @@ void CPlaybar::mouseReleaseEvent(QMouseEvent* event)
     if (event->button() != Qt::LeftButton || !isSliderDown())
         return;
     setSliderDown(false);
-    if (m_kMouseUp)
-        m_kMouseUp();
+    if (mouseUp)
+        mouseUp();
 }
 
 void CPlaybar::keyPressEvent(QKeyEvent* event)

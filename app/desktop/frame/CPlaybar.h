@@ -12,9 +12,9 @@ class CPlaybar : public QSlider
 public:
     explicit CPlaybar(QWidget* parent) : QSlider(Qt::Horizontal, parent) {}
 
-    std::function<void()> m_kMouseDown;
-    std::function<void(int value)> m_kScroll;
-    std::function<void()> m_kMouseUp;
+    std::function<void()> mouseDown;
+    std::function<void(int value)> scroll;
+    std::function<void()> mouseUp;
 
 protected:
     void mousePressEvent(QMouseEvent* event) override;

@@ -84,8 +84,8 @@ void CProfileCombo::ShowSelection()
 void CProfileCombo::Choose(int index)
 {
     SetCurSel(index);
-    if (m_kNotify)
-        m_kNotify(kChosen);
+    if (notify_)
+        notify_(kChosen);
 }
 
 } // namespace gw

@@ -27,14 +27,14 @@ public:
     /// Both may die before this. The font size is in tenths of a point.
     void SetChildren(QComboBox* field, QAbstractButton* arrow, int fontSize);
     /// What a choice by hand calls, after the selection.
-    void SetNotify(std::function<void(int code)> notify) { m_kNotify = std::move(notify); }
+    void SetNotify(std::function<void(int code)> notify) { notify_ = std::move(notify); }
 
 private:
     void ShowSelection();
     void Choose(int index);
 
     QPointer<QComboBox> m_kField;
-    std::function<void(int)> m_kNotify;
+    std::function<void(int)> notify_;
 };
 
 } // namespace gw

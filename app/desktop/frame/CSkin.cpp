@@ -45,7 +45,7 @@ std::string_view BareName(std::string_view child)
 }
 
 // "kind name left top width height [picture [picture]]"
-bool ReadChild(std::string_view line, CSkinChild& child)
+bool ReadChild(std::string_view line, SkinChild& child)
 {
     child.kind = NextWord(line);
     child.name = NextWord(line);
@@ -111,7 +111,7 @@ bool CSkin::ReadLayout(std::string_view text, std::string& problem)
         const std::string_view word = NextWord(rest);
         if (word.empty() || word.front() == ';')
             continue;
-        CSkinChild child;
+        SkinChild child;
         if (word == "size" ? ReadSize(line, m_kSize) : ReadChild(line, child))
         {
             if (word != "size")
@@ -134,13 +134,13 @@ bool CSkin::HasAllParts(std::string& problem) const
     }
     for (const std::string_view name : kNeededChildren)
     {
-        if (std::ranges::find(m_kChildren, name, &CSkinChild::name) == m_kChildren.end())
+        if (std::ranges::find(m_kChildren, name, &SkinChild::name) == m_kChildren.end())
         {
             problem = m_kFolder + kLayoutFile + " has no child \"" + std::string(name) + "\".";
             return false;
         }
     }
-    for (const CSkinChild& child : m_kChildren)
+    for (const SkinChild& child : m_kChildren)
     {
         for (const std::string& icon : {child.icon, child.secondIcon})
         {

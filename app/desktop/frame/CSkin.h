@@ -11,7 +11,7 @@
 namespace gw {
 
 /// One child of the window's face, as the skin places it.
-struct CSkinChild
+struct SkinChild
 {
     std::string kind;
     std::string name; ///< "#" begins displays, "|" scroll bars, "%" two-state buttons
@@ -29,7 +29,7 @@ public:
     bool Load(const std::string& folder, std::string& problem);
 
     QSize Size() const { return m_kSize; }
-    const std::vector<CSkinChild>& Children() const { return m_kChildren; }
+    const std::vector<SkinChild>& Children() const { return m_kChildren; }
     const QString& StyleSheet() const { return m_kStyleSheet; }
     /// The text of a child: what it shows, or with ".name" or ".tip" behind the child's name how it is called
     /// and what its tool tip says. Empty where the skin has none.
@@ -47,7 +47,7 @@ private:
     std::string m_kTexts;
     QString m_kStyleSheet;
     QSize m_kSize;
-    std::vector<CSkinChild> m_kChildren;
+    std::vector<SkinChild> m_kChildren;
 };
 
 } // namespace gw

@@ -14,8 +14,8 @@ void CTitleLabel::ShowAtOnce(const QString& text)
 
 void CTitleLabel::mousePressEvent(QMouseEvent* event)
 {
-    if (event->button() == Qt::LeftButton && m_kMouseDown)
-        m_kMouseDown(event->globalPosition().toPoint());
+    if (event->button() == Qt::LeftButton && mouseDown)
+        mouseDown(event->globalPosition().toPoint());
     else
         QLabel::mousePressEvent(event);
 }

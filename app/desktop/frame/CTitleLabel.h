@@ -14,7 +14,7 @@ public:
     /// Paints at once, also while an operation keeps the program from its events.
     void ShowAtOnce(const QString& text);
 
-    std::function<void(const QPoint& globalPosition)> m_kMouseDown;
+    std::function<void(const QPoint& globalPosition)> mouseDown;
 
 protected:
     void mousePressEvent(QMouseEvent* event) override;

@@ -39,7 +39,7 @@ private:
     QIcon m_kIcon;
 };
 
-QWidget* MakeLabel(const CSkinChild& child, const CSkin& skin, QWidget* face)
+QWidget* MakeLabel(const SkinChild& child, const CSkin& skin, QWidget* face)
 {
     auto* const label = new QLabel(skin.Text(child.name), face);
     label->setTextFormat(Qt::PlainText);
@@ -98,7 +98,7 @@ QWidget* MakeLine(QWidget* face)
     return line;
 }
 
-QWidget* MakeWidget(const CSkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
+QWidget* MakeWidget(const SkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
 {
     if (child.kind == "picture")
         return new CPicture(skin.Icon(child.icon), face);
@@ -119,7 +119,7 @@ QWidget* MakeWidget(const CSkinChild& child, const CSkin& skin, const CLeftKeys&
 
 } // namespace
 
-CFaceButton::CFaceButton(const CSkinChild& child, const CSkin& skin, QWidget* face)
+CFaceButton::CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* face)
     : QPushButton(face), m_kFirst(skin.Icon(child.icon)),
       m_kSecond(child.secondIcon.empty() ? m_kFirst : skin.Icon(child.secondIcon))
 {
@@ -139,7 +139,7 @@ void CFaceButton::keyPressEvent(QKeyEvent* event)
         QPushButton::keyPressEvent(event);
 }
 
-QWidget* MakeFaceChild(const CSkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
+QWidget* MakeFaceChild(const SkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)
 {
     QWidget* const widget = MakeWidget(child, skin, keys, face);
     const QString name = skin.Text(child.name, ".name");

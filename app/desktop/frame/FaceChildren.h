@@ -12,7 +12,7 @@ class CLeftKeys;
 class CFaceButton : public QPushButton
 {
 public:
-    CFaceButton(const CSkinChild& child, const CSkin& skin, QWidget* face);
+    CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* face);
 
     /// 0 is the first picture, anything else the second one.
     void SetFace(int face) { setIcon(face == 0 ? m_kFirst : m_kSecond); }
@@ -26,6 +26,6 @@ private:
 };
 
 /// Makes the widget of a child, named, placed and with its texts. The face owns it.
-QWidget* MakeFaceChild(const CSkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face);
+QWidget* MakeFaceChild(const SkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face);
 
 } // namespace gw

@@ -24,7 +24,7 @@ namespace {
 constexpr size_t kShownCharacters = 300; // of a line; its end is of no use in a list
 
 // A line as a list can show it: not too long, and without characters that would break it.
-QString ShownLine(const CMapLine& line)
+QString ShownLine(const MapLine& line)
 {
     return ToQString(Printable(FirstCharacters(line.text, kShownCharacters)));
 }
@@ -90,17 +90,17 @@ void CGaitToolWindow::keyPressEvent(QKeyEvent* event)
 
 // ---- what the tool asks
 
-std::optional<std::string> CGaitToolWindow::AskOpenFile(const CFileDialogSetup& setup)
+std::optional<std::string> CGaitToolWindow::AskOpenFile(const FileDialogSetup& setup)
 {
     return RunFileDialog(*this, QFileDialog::AcceptOpen, setup);
 }
 
-std::optional<std::string> CGaitToolWindow::AskSaveFile(const CFileDialogSetup& setup)
+std::optional<std::string> CGaitToolWindow::AskSaveFile(const FileDialogSetup& setup)
 {
     return RunFileDialog(*this, QFileDialog::AcceptSave, setup);
 }
 
-bool CGaitToolWindow::EditLine(CMapLine& line)
+bool CGaitToolWindow::EditLine(MapLine& line)
 {
     CMapLineDialog dialog(line, this);
     if (dialog.exec() != QDialog::Accepted)
@@ -153,7 +153,7 @@ void CGaitToolWindow::ShowLines()
 {
     const CMapLineList& map = m_kTool.Map();
     QStringList texts;
-    for (const CMapLine& line : map.Lines())
+    for (const MapLine& line : map.Lines())
         texts << ShownLine(line);
     const QScopedValueRollback showing(m_bShowing, true);
     const bool grew = texts.size() > m_kLineTexts.rowCount();

@@ -37,9 +37,9 @@ protected:
     void keyPressEvent(QKeyEvent* event) override;
 
 private:
-    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
-    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
-    bool EditLine(CMapLine& line) override;
+    std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override;
+    bool EditLine(MapLine& line) override;
     std::unique_ptr<CMotionView> CreateView(EToolMotion motion) override;
     void CloseWindow() override { accept(); }
     void BeginWaitCursor() override;

@@ -52,7 +52,7 @@ QString LineText(const char* text)
 
 } // namespace
 
-CMapLineDialog::CMapLineDialog(const CMapLine& line, QWidget* owner) : QDialog(owner), m_kLine(line)
+CMapLineDialog::CMapLineDialog(const MapLine& line, QWidget* owner) : QDialog(owner), m_kLine(line)
 {
     setLocale(QLocale::c());
     const auto* const made = std::ranges::find(kTemplates, line.kind, &Template::m_eKind);
@@ -82,7 +82,7 @@ void CMapLineDialog::AddFields(QFormLayout& form)
         break;
     case EMapLine::FrameRate:
         AddNumber(form, windowTitle(), m_kLine.frameRate,
-                  [](CMapLine& line, int rate) { line.frameRate = rate; });
+                  [](MapLine& line, int rate) { line.frameRate = rate; });
         break;
     case EMapLine::Fixed:
     case EMapLine::Text:
@@ -95,7 +95,7 @@ void CMapLineDialog::AddNumbers(QFormLayout& form)
 {
     for (size_t i = 0; i < std::size(kAxes); ++i)
     {
-        const auto store = [axis = kAxes[i]](CMapLine& line, int value) {
+        const auto store = [axis = kAxes[i]](MapLine& line, int value) {
             line.numbers.*axis = static_cast<float>(value);
         };
         AddNumber(form, QString::fromLatin1(kAxisNames[i]), CutToInteger(m_kLine.numbers.*kAxes[i]), store);
@@ -103,7 +103,7 @@ void CMapLineDialog::AddNumbers(QFormLayout& form)
 }
 
 void CMapLineDialog::AddNumber(QFormLayout& form, const QString& label, int value,
-                               std::function<void(CMapLine&, int)> store)
+                               std::function<void(MapLine&, int)> store)
 {
     auto* const field = new QSpinBox(this);
     field->setObjectName(label);
@@ -114,7 +114,7 @@ void CMapLineDialog::AddNumber(QFormLayout& form, const QString& label, int valu
     field->setValue(value);
     field->setFixedWidth(kFieldWidth);
     form.addRow(label, field);
-    m_kStore.emplace_back([field, store = std::move(store)](CMapLine& line) { store(line, field->value()); });
+    m_kStore.emplace_back([field, store = std::move(store)](MapLine& line) { store(line, field->value()); });
 }
 
 void CMapLineDialog::AddText(QFormLayout& form)
@@ -124,12 +124,12 @@ void CMapLineDialog::AddText(QFormLayout& form)
     field->setAccessibleName(windowTitle());
     field->setFixedWidth(kFieldWidth);
     form.addRow(windowTitle(), field);
-    m_kStore.emplace_back([field](CMapLine& line) { line.text = ToUtf8(field->text()); });
+    m_kStore.emplace_back([field](MapLine& line) { line.text = ToUtf8(field->text()); });
 }
 
-CMapLine CMapLineDialog::Line() const
+MapLine CMapLineDialog::Line() const
 {
-    CMapLine line = m_kLine;
+    MapLine line = m_kLine;
     for (const auto& store : m_kStore)
         store(line);
     return line;

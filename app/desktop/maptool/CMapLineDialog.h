@@ -14,20 +14,20 @@ namespace gw {
 class CMapLineDialog : public QDialog
 {
 public:
-    CMapLineDialog(const CMapLine& line, QWidget* owner);
+    CMapLineDialog(const MapLine& line, QWidget* owner);
 
     /// The line with what the fields hold.
-    CMapLine Line() const;
+    MapLine Line() const;
 
 private:
     void AddFields(QFormLayout& form);
     void AddNumbers(QFormLayout& form);
     void AddNumber(QFormLayout& form, const QString& label, int value,
-                   std::function<void(CMapLine&, int)> store);
+                   std::function<void(MapLine&, int)> store);
     void AddText(QFormLayout& form);
 
-    CMapLine m_kLine;
-    std::vector<std::function<void(CMapLine&)>> m_kStore; // one a field
+    MapLine m_kLine;
+    std::vector<std::function<void(MapLine&)>> m_kStore; // one a field
 };
 
 } // namespace gw

@@ -121,7 +121,7 @@ QLayout* CMotionPanel::MakeTransport()
     {
         auto* const button = new CIconButton(icon, QCoreApplication::translate(kContext, name), this);
         button->setObjectName(QString::number(*id));
-        connect(button, &QPushButton::clicked, this, [this, id = *id] { m_kClicked(id); });
+        connect(button, &QPushButton::clicked, this, [this, id = *id] { clicked_(id); });
         row->addWidget(button);
         ++id;
     }
@@ -143,7 +143,7 @@ void CMotionPanel::ShowFrame(int frame, int lastFrame)
 
 void CMotionPanel::SetDropped(std::function<void(const QString&)> dropped)
 {
-    m_kDropped = std::move(dropped);
+    dropped_ = std::move(dropped);
     setAcceptDrops(true);
 }
 
@@ -156,7 +156,7 @@ void CMotionPanel::dragEnterEvent(QDragEnterEvent* event)
 void CMotionPanel::dropEvent(QDropEvent* event)
 {
     event->acceptProposedAction();
-    m_kDropped(MotionFileOf(*event->mimeData()));
+    dropped_(MotionFileOf(*event->mimeData()));
 }
 
 } // namespace gw

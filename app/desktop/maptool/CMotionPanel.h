@@ -26,7 +26,7 @@ public:
     std::unique_ptr<CMotionView> MakeView();
     void ShowFrame(int frame, int lastFrame);
     /// Called with the id of a transport button.
-    void SetClicked(std::function<void(int id)> clicked) { m_kClicked = std::move(clicked); }
+    void SetClicked(std::function<void(int id)> clicked) { clicked_ = std::move(clicked); }
     /// Called with a dropped motion file. Without this, nothing may be dropped.
     void SetDropped(std::function<void(const QString& path)> dropped);
 
@@ -42,8 +42,8 @@ private:
     EToolMotion m_eMotion;
     QLabel* m_pkFrame = nullptr;
     CPreviewWidget* m_pkPreview = nullptr;
-    std::function<void(int)> m_kClicked;
-    std::function<void(const QString&)> m_kDropped;
+    std::function<void(int)> clicked_;
+    std::function<void(const QString&)> dropped_;
 };
 
 } // namespace gw

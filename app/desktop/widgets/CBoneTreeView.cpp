@@ -151,7 +151,7 @@ void CBoneTreeView::selectionChanged(const QItemSelection& selected, const QItem
 {
     QTreeWidget::selectionChanged(selected, deselected);
     if (!m_bShowing)
-        m_kOnSelect(ItemOf(selectedItems().value(0)));
+        onSelect_(ItemOf(selectedItems().value(0)));
 }
 
 } // namespace gw

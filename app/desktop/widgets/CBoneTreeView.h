@@ -17,7 +17,7 @@ public:
     explicit CBoneTreeView(QWidget* parent);
 
     /// Tells of the item that the user selected, or kNone.
-    void SetOnSelect(std::function<void(int item)> onSelect) { m_kOnSelect = std::move(onSelect); }
+    void SetOnSelect(std::function<void(int item)> onSelect) { onSelect_ = std::move(onSelect); }
     /// Shows a tree as it stands: all of it for an empty filter, else a flat list of the bones that the
     /// filter finds.
     void ShowTree(const CBoneTree& tree, const std::string& filter);
@@ -46,7 +46,7 @@ private:
     bool IsFlat() const { return !m_kFilter.empty(); }
     Bone& BoneOf(int item) { return m_kBones[static_cast<size_t>(item)]; }
 
-    std::function<void(int item)> m_kOnSelect = [](int) {};
+    std::function<void(int item)> onSelect_ = [](int) {};
     std::vector<Bone> m_kBones; ///< by the tree's items
     std::vector<int> m_kOrder;  ///< the items that are shown, from the top on
     std::string m_kFilter;

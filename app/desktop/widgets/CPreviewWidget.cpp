@@ -66,9 +66,7 @@ bool CPreviewWidget::CWidgetView::SetupPixelFormat()
     return true;
 }
 
-CPreviewWidget::CPreviewWidget(const CLeftKeys& keys, QWidget* parent) : QOpenGLWidget(parent), m_kKeys(keys)
-{
-}
+CPreviewWidget::CPreviewWidget(const CLeftKeys& keys, QWidget* parent) : QOpenGLWidget(parent), keys_(keys) {}
 
 std::unique_ptr<CGLView> CPreviewWidget::MakeView()
 {
@@ -114,8 +112,7 @@ void CPreviewWidget::mouseMoveEvent(QMouseEvent* event)
 {
     const QPoint at = event->position().toPoint();
     if (m_pkView)
-        m_pkView->MouseMove(at.x(), at.y(),
-                            {m_kKeys.IsDown(EKey::LeftCtrl), m_kKeys.IsDown(EKey::LeftShift)});
+        m_pkView->MouseMove(at.x(), at.y(), {keys_.IsDown(EKey::LeftCtrl), keys_.IsDown(EKey::LeftShift)});
 }
 
 // The toolkit's screens that mix no GL into a window may give a context all the same, and crash in the

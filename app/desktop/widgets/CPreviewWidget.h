@@ -34,7 +34,7 @@ protected:
 private:
     class CWidgetView;
 
-    const CLeftKeys& m_kKeys;
+    const CLeftKeys& keys_;
     CGLView* m_pkView = nullptr;
 };
 

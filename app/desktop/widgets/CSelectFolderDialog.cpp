@@ -80,7 +80,7 @@ QString BeginningFolder(const std::string& wanted)
     return QDir::homePath();
 }
 
-QStringList Patterns(const CFileFilter& choice)
+QStringList Patterns(const FileFilter& choice)
 {
     QStringList patterns;
     for (const std::string& pattern : choice.patterns)
@@ -90,7 +90,7 @@ QStringList Patterns(const CFileFilter& choice)
 
 } // namespace
 
-CSelectFolderDialog::CSelectFolderDialog(QWidget* owner, const CFileDialogSetup& setup)
+CSelectFolderDialog::CSelectFolderDialog(QWidget* owner, const FileDialogSetup& setup)
     : QDialog(owner), m_pkModel(new CFolderModel(this))
 {
     Named(this, "selectFolder", DialogText("Select folder"));
@@ -155,7 +155,7 @@ QLayout* CSelectFolderDialog::MakeFilterRow(const std::string& filter)
     connect(m_pkFilter, &QComboBox::currentIndexChanged, this,
             [this](int choice) { m_pkModel->setNameFilters(m_pkFilter->itemData(choice).toStringList()); });
     m_pkModel->setFilter(m_pkModel->filter() | QDir::Files);
-    for (const CFileFilter& choice : SplitFilter(filter))
+    for (const FileFilter& choice : SplitFilter(filter))
         m_pkFilter->addItem(ToQString(choice.text), Patterns(choice));
 
     auto* row = new QHBoxLayout;
@@ -228,12 +228,12 @@ void CSelectFolderDialog::accept()
     QDialog::accept();
 }
 
-CFolderChoice CSelectFolderDialog::Choice() const
+FolderChoice CSelectFolderDialog::Choice() const
 {
     return {m_kFolder, m_pkFilter ? m_pkFilter->currentIndex() + 1 : 1};
 }
 
-std::optional<CFolderChoice> AskFolder(QWidget* owner, const CFileDialogSetup& setup)
+std::optional<FolderChoice> AskFolder(QWidget* owner, const FileDialogSetup& setup)
 {
     CSelectFolderDialog dialog(owner, setup);
     if (dialog.exec() != QDialog::Accepted)

@@ -18,10 +18,10 @@ class CSelectFolderDialog : public QDialog
 {
 public:
     /// An empty filter shows none. An initial folder that there is not is that of the user's documents.
-    CSelectFolderDialog(QWidget* owner, const CFileDialogSetup& setup);
+    CSelectFolderDialog(QWidget* owner, const FileDialogSetup& setup);
 
     /// What was chosen, once the dialog has ended with OK.
-    CFolderChoice Choice() const;
+    FolderChoice Choice() const;
 
     /// Takes the text: asks about a folder that there is not, and takes it whatever the answer.
     void accept() override;
@@ -47,6 +47,6 @@ private:
 };
 
 /// Asks for a folder; nothing when the dialog was cancelled.
-std::optional<CFolderChoice> AskFolder(QWidget* owner, const CFileDialogSetup& setup);
+std::optional<FolderChoice> AskFolder(QWidget* owner, const FileDialogSetup& setup);
 
 } // namespace gw

@@ -11,7 +11,7 @@ namespace {
 QStringList NameFilters(const std::string& filter)
 {
     QStringList names;
-    for (const CFileFilter& choice : SplitFilter(filter))
+    for (const FileFilter& choice : SplitFilter(filter))
     {
         QStringList patterns;
         for (const std::string& pattern : choice.patterns)
@@ -25,7 +25,7 @@ QStringList NameFilters(const std::string& filter)
 } // namespace
 
 std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode mode,
-                                         const CFileDialogSetup& setup)
+                                         const FileDialogSetup& setup)
 {
     QFileDialog dialog(&owner);
     dialog.setOptions(QFileDialog::DontUseNativeDialog | QFileDialog::HideNameFilterDetails);

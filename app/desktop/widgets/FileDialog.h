@@ -10,6 +10,6 @@ namespace gw {
 
 /// Runs the toolkit's own file dialog over a window. None when it was cancelled.
 std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode mode,
-                                         const CFileDialogSetup& setup);
+                                         const FileDialogSetup& setup);
 
 } // namespace gw

@@ -15,17 +15,17 @@ class CGLPicturePainter : public CPicturePainter
 public:
     bool Begin(int width, int height) override;
     RgbPicture Paint(const GLScene& scene, int width, int height) override;
-    void End() override { m_kContext.reset(); }
+    void End() override { context_.reset(); }
     std::vector<std::byte> EncodePng(const RgbPicture& picture) override;
 
 private:
-    std::optional<COffscreenContext> m_kContext;
+    std::optional<COffscreenContext> context_;
 };
 
 bool CGLPicturePainter::Begin(int width, int height)
 {
-    m_kContext.reset(); // before another one is current
-    if (!m_kContext.emplace().Create(width, height))
+    context_.reset(); // before another one is current
+    if (!context_.emplace().Create(width, height))
         return false;
     InitGL();
     return true;
@@ -35,7 +35,7 @@ RgbPicture CGLPicturePainter::Paint(const GLScene& scene, int width, int height)
 {
     ResizeGL(width, height);
     PaintGL(scene);
-    return m_kContext->ReadPixels(width, height);
+    return context_->ReadPixels(width, height);
 }
 
 std::vector<std::byte> CGLPicturePainter::EncodePng(const RgbPicture& picture)

@@ -40,7 +40,7 @@ int32_t DotsPerInch(double density, Magick::ResolutionType units)
                : static_cast<int32_t>(std::lround(density));
 }
 
-CPictureHead HeadOf(const Magick::Image& image)
+PictureHead HeadOf(const Magick::Image& image)
 {
     const Magick::Geometry page = image.page();
     return {.width = static_cast<int32_t>(image.columns()),
@@ -98,7 +98,7 @@ void ConvertToSRGB(Magick::Image& image)
 
 bool HandOver(Magick::Image& image, const CPictureSink& sink)
 {
-    const CPictureHead head = HeadOf(image);
+    const PictureHead head = HeadOf(image);
     uint8_t* const pixels = head.width > 0 && head.height > 0 ? sink(head) : nullptr;
     if (!pixels)
         return false;
@@ -126,7 +126,7 @@ void PrepareGif(Magick::Image& image)
     image.quantize();
 }
 
-void EncodeFrame(const CPictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
+void EncodeFrame(const PictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
                  int32_t quality, std::vector<uint8_t>& file)
 {
     Magick::Image image(static_cast<size_t>(head.width), static_cast<size_t>(head.height),
@@ -160,7 +160,7 @@ public:
         return false;
     }
 
-    bool Encode(const CPictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
+    bool Encode(const PictureHead& head, const uint8_t* pixels, int32_t bytesPerPixel, const char* format,
                 int32_t quality, std::vector<uint8_t>& file) override
     try
     {

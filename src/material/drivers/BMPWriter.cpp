@@ -60,7 +60,7 @@ bool CBMPPicture::SetChannelCount(int count)
     return true;
 }
 
-bool CBMPPicture::SetSize(const CPictureBox& box)
+bool CBMPPicture::SetSize(const PictureBox& box)
 {
     if (!m_pkOut || HasBegun() || box.width <= 0 || box.height <= 0)
         return false;
@@ -124,13 +124,13 @@ bool CBMPPicture::WriteRow(int y, int x, int count, const uint8_t* pixels)
     return FinishRow();
 }
 
-bool CBMPPicture::WriteRowRGBA(int y, int x, int count, const CPixelRGBA* pixels)
+bool CBMPPicture::WriteRowRGBA(int y, int x, int count, const PixelRGBA* pixels)
 {
     if (!BeginRow(y, x, count))
         return false;
     for (int i = 0; i < count; ++i)
     {
-        const CPixelRGBA& pixel = pixels[i];
+        const PixelRGBA& pixel = pixels[i];
         uint8_t* const channels = ChannelsAt(x + i);
         channels[0] = m_iChannels == 1 ? Brightness(pixel) : pixel.b;
         if (m_iChannels == 1)

@@ -16,7 +16,7 @@ constexpr uint32_t kInfoHeaderBytes = 40;
 constexpr int kDepths[] = {1, 2, 4, 8, 16, 24, 32};
 constexpr uint64_t kStreamRowLimit = uint64_t{1} << 25; // of a stream that does not tell what it holds
 
-static_assert(sizeof(CBMPInfoHeader) == kInfoHeaderBytes);
+static_assert(sizeof(BMPInfoHeader) == kInfoHeaderBytes);
 
 // Five bits as eight: the high ones fill up the low ones, so that the ends are 0 and 255.
 constexpr std::array<uint8_t, 32> MakeFiveBitTable()
@@ -158,7 +158,7 @@ uint8_t CBMPPicture::IndexAt(int x) const
     return static_cast<uint8_t>(m_kRow[bit / 8] >> shift & ((1u << depth) - 1));
 }
 
-CPixelRGBA CBMPPicture::PixelAt(int x) const
+PixelRGBA CBMPPicture::PixelAt(int x) const
 {
     const unsigned depth = m_kInfoHeader.bitCount;
     if (depth < 16)
@@ -179,7 +179,7 @@ bool CBMPPicture::ReadRow(int y, int x, int count, uint8_t* pixels)
     return true;
 }
 
-bool CBMPPicture::ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels)
+bool CBMPPicture::ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels)
 {
     if (!ReadRowBytes(y, x, count))
         return false;

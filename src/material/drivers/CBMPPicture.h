@@ -12,7 +12,7 @@
 namespace gw {
 
 /// What a BMP file begins with: 14 bytes, without gaps.
-struct CBMPFileHeader
+struct BMPFileHeader
 {
     uint16_t type = 0;
     uint32_t size = 0; ///< of the file
@@ -22,7 +22,7 @@ struct CBMPFileHeader
 };
 
 /// The 40 bytes behind it, as they stand.
-struct CBMPInfoHeader
+struct BMPInfoHeader
 {
     uint32_t size = 0; ///< of this header; larger ones have more fields behind it
     int32_t width = 0;
@@ -52,14 +52,14 @@ public:
     const char* MessageName() const override { return "picbmp"; }
     bool Close() override;
     int ChannelCount() const override { return m_iChannels; }
-    CPictureBox Box() const override { return {0, 0, m_iWidth, m_iHeight}; }
+    PictureBox Box() const override { return {0, 0, m_iWidth, m_iHeight}; }
     bool IsBottomFirst() const override { return m_bReading && !m_bTopDown && !m_kInput.IsStream(); }
     bool ReadRow(int y, int x, int count, uint8_t* pixels) override;
-    bool ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels) override;
+    bool ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels) override;
     bool SetChannelCount(int count) override;
-    bool SetSize(const CPictureBox& box) override;
+    bool SetSize(const PictureBox& box) override;
     bool WriteRow(int y, int x, int count, const uint8_t* pixels) override;
-    bool WriteRowRGBA(int y, int x, int count, const CPixelRGBA* pixels) override;
+    bool WriteRowRGBA(int y, int x, int count, const PixelRGBA* pixels) override;
 
 private:
     bool OpenToRead();
@@ -72,7 +72,7 @@ private:
     bool ReadPalette();
     bool ReadRowBytes(int y, int x, int count);
     uint8_t IndexAt(int x) const;
-    CPixelRGBA PixelAt(int x) const;
+    PixelRGBA PixelAt(int x) const;
 
     bool HasBegun() const { return m_iRow > 0; }
     bool BeginRow(int y, int x, int count);
@@ -81,9 +81,9 @@ private:
     uint8_t* ChannelsAt(int x);
     void CloseFile();
 
-    CBMPFileHeader m_kFileHeader;
-    CBMPInfoHeader m_kInfoHeader;
-    std::array<CPixelRGBA, 256> m_kPalette{};
+    BMPFileHeader m_kFileHeader;
+    BMPInfoHeader m_kInfoHeader;
+    std::array<PixelRGBA, 256> m_kPalette{};
     bool m_bReading = false;
     bool m_bTopDown = false;
     bool m_bFailed = false; // a write that the file system did not take

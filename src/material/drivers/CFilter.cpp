@@ -13,13 +13,13 @@ namespace {
 
 constexpr double kPi = std::numbers::pi;
 
-struct CMitchellData
+struct MitchellData
 {
     double p0, p1, p2;
     double q0, q1, q2, q3;
 };
 
-struct CKaiserData
+struct KaiserData
 {
     double a;
     double i0a; // 1 / I0(a)
@@ -76,7 +76,7 @@ double Mitchell(double x, const void* clientData)
 {
     if (!clientData || x < -2.0 || x >= 2.0)
         return 0.0;
-    const auto& [p0, p1, p2, q0, q1, q2, q3] = *static_cast<const CMitchellData*>(clientData);
+    const auto& [p0, p1, p2, q0, q1, q2, q3] = *static_cast<const MitchellData*>(clientData);
     if (x < -1.0)
         return q0 - x * (q1 - x * (q2 - x * q3));
     if (x < 0.0)
@@ -88,7 +88,7 @@ double Mitchell(double x, const void* clientData)
 
 void InitMitchell(CFilter& filter, double b, double c)
 {
-    filter.clientData = std::make_shared<CMitchellData>(CMitchellData{
+    filter.clientData = std::make_shared<MitchellData>(MitchellData{
         (6.0 - 2.0 * b) / 6.0,
         (12.0 * b + 6.0 * c - 18.0) / 6.0,
         (12.0 - 9.0 * b - 6.0 * c) / 6.0,
@@ -134,13 +134,13 @@ double Kaiser(double x, const void* clientData)
 {
     if (!clientData)
         return 0.0;
-    const auto& [a, i0a] = *static_cast<const CKaiserData*>(clientData);
+    const auto& [a, i0a] = *static_cast<const KaiserData*>(clientData);
     return BesselI0(a * std::sqrt(1.0 - x * x)) * i0a;
 }
 
 void InitKaiser(CFilter& filter, double a, double)
 {
-    filter.clientData = std::make_shared<CKaiserData>(CKaiserData{a, 1.0 / BesselI0(a)});
+    filter.clientData = std::make_shared<KaiserData>(KaiserData{a, 1.0 / BesselI0(a)});
 }
 
 // Name, function, support, blur, needs a window, cardinal, unit range, init, print, client data.

@@ -21,7 +21,7 @@ CPicture* CGIFPicture::Open(const char* fileName, const char* mode)
 // The image at hand stays where there is no other.
 bool CGIFPicture::NextPicture()
 {
-    CGIFImage image;
+    GIFImage image;
     if (!m_kReader.ReadImage(image))
         return false;
     m_kImage = std::move(image);
@@ -38,7 +38,7 @@ bool CGIFPicture::ReadRow(int y, int x, int count, uint8_t* pixels)
     return true;
 }
 
-bool CGIFPicture::ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels)
+bool CGIFPicture::ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels)
 {
     if (!IsInside(y, x, count, Box()))
         return false;

@@ -18,17 +18,17 @@ public:
 
     const char* MessageName() const override { return "gif"; }
     int ChannelCount() const override { return 3; }
-    CPictureBox Box() const override { return {0, 0, m_kImage.box.width, m_kImage.box.height}; }
+    PictureBox Box() const override { return {0, 0, m_kImage.box.width, m_kImage.box.height}; }
     bool ReadRow(int y, int x, int count, uint8_t* pixels) override;
-    bool ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels) override;
+    bool ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels) override;
     bool NextPicture() override;
     /// The image that rows are read from.
-    const CGIFImage& Image() const { return m_kImage; }
+    const GIFImage& Image() const { return m_kImage; }
 
 private:
     CPicInput m_kInput;
     CGIFReader m_kReader;
-    CGIFImage m_kImage;
+    GIFImage m_kImage;
 };
 
 } // namespace gw

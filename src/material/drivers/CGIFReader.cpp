@@ -54,7 +54,7 @@ bool CGIFReader::ReadHeader()
 {
     char signature[6];
     uint8_t screen[7];
-    if (!m_kInput.ReadValue(signature) || !m_kInput.ReadValue(screen))
+    if (!input_.ReadValue(signature) || !input_.ReadValue(screen))
         return false;
     const std::string_view name(signature, 3);
     const std::string_view version(signature + 3, 3);
@@ -76,17 +76,17 @@ bool CGIFReader::ReadPalette(uint8_t flags, Palette& palette)
     for (size_t i = 0; i < count; ++i)
     {
         uint8_t color[3];
-        if (!m_kInput.ReadValue(color))
+        if (!input_.ReadValue(color))
             return false;
         palette[i] = {color[0], color[1], color[2], 255};
     }
     return true;
 }
 
-bool CGIFReader::ReadImage(CGIFImage& image)
+bool CGIFReader::ReadImage(GIFImage& image)
 {
     Control control;
-    for (uint8_t block = 0; m_kInput.ReadValue(block);)
+    for (uint8_t block = 0; input_.ReadValue(block);)
     {
         if (block == kImageBlock)
             return ReadDescriptor(control, image);
@@ -99,7 +99,7 @@ bool CGIFReader::ReadImage(CGIFImage& image)
 bool CGIFReader::ReadExtension(Control& control)
 {
     uint8_t label = 0;
-    if (!m_kInput.ReadValue(label))
+    if (!input_.ReadValue(label))
         return false;
     if (label == kControlLabel && !ReadControl(control))
         return false;
@@ -121,7 +121,7 @@ bool CGIFReader::ReadControl(Control& control)
 // A size and as many bytes; a size of 0 ends a chain of blocks.
 bool CGIFReader::ReadBlock(uint8_t& size)
 {
-    return m_kInput.ReadValue(size) && m_kInput.Read(std::as_writable_bytes(std::span(m_aBlock).first(size)));
+    return input_.ReadValue(size) && input_.Read(std::as_writable_bytes(std::span(m_aBlock).first(size)));
 }
 
 bool CGIFReader::SkipBlocks()
@@ -135,10 +135,10 @@ bool CGIFReader::SkipBlocks()
     return false;
 }
 
-bool CGIFReader::ReadDescriptor(const Control& control, CGIFImage& image)
+bool CGIFReader::ReadDescriptor(const Control& control, GIFImage& image)
 {
     uint8_t place[9];
-    if (!m_kInput.ReadValue(place))
+    if (!input_.ReadValue(place))
         return false;
     image.box = {WordAt(place), WordAt(place + 2), WordAt(place + 4), WordAt(place + 6)};
     image.delay = control.delay;
@@ -153,13 +153,13 @@ bool CGIFReader::ReadDescriptor(const Control& control, CGIFImage& image)
 
 // Pixels that are missing are a failure. Blocks behind the last one are not needed, so that a file may end
 // there.
-bool CGIFReader::ReadPixels(bool isInterlaced, CGIFImage& image)
+bool CGIFReader::ReadPixels(bool isInterlaced, GIFImage& image)
 {
     const auto width = static_cast<size_t>(image.box.width);
     const auto height = static_cast<size_t>(image.box.height);
     const size_t count = width * height;
     uint8_t pixelBits = 0;
-    if (!m_kInput.ReadValue(pixelBits) || pixelBits < 1 || pixelBits > 8 || count == 0 || count > kMostPixels)
+    if (!input_.ReadValue(pixelBits) || pixelBits < 1 || pixelBits > 8 || count == 0 || count > kMostPixels)
         return false;
     image.pixels.clear();
     image.pixels.reserve(count);

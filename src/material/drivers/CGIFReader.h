@@ -13,13 +13,13 @@ namespace gw {
 class CPicInput;
 
 /// One image of a GIF file, with what an animation needs to know of it.
-struct CGIFImage
+struct GIFImage
 {
-    CPictureBox box;                       ///< where it stands on the screen
-    std::array<CPixelRGBA, 256> palette{}; ///< the transparent entry has alpha 0, all others 255
-    std::vector<uint8_t> pixels;           ///< indices into the palette, row by row from the top
-    uint16_t delay = 0;                    ///< hundredths of a second
-    uint8_t disposal = 0;                  ///< what becomes of it before the next one
+    PictureBox box;                       ///< where it stands on the screen
+    std::array<PixelRGBA, 256> palette{}; ///< the transparent entry has alpha 0, all others 255
+    std::vector<uint8_t> pixels;          ///< indices into the palette, row by row from the top
+    uint16_t delay = 0;                   ///< hundredths of a second
+    uint8_t disposal = 0;                 ///< what becomes of it before the next one
 };
 
 /// Reads the images of a GIF87a or GIF89a file one after another. Every failure is final.
@@ -27,17 +27,17 @@ class CGIFReader
 {
 public:
     /// The input must outlive the reader.
-    explicit CGIFReader(CPicInput& input) : m_kInput(input) {}
+    explicit CGIFReader(CPicInput& input) : input_(input) {}
 
     /// Everything up to the first block. False for what is no GIF file.
     bool ReadHeader();
     /// The next image. False at the end of the file and for one that is damaged; the image is undefined then.
-    bool ReadImage(CGIFImage& image);
+    bool ReadImage(GIFImage& image);
     int ScreenWidth() const { return m_iScreenWidth; }
     int ScreenHeight() const { return m_iScreenHeight; }
 
 private:
-    using Palette = std::array<CPixelRGBA, 256>;
+    using Palette = std::array<PixelRGBA, 256>;
     /// What a control extension says of the next image.
     struct Control
     {
@@ -51,10 +51,10 @@ private:
     bool ReadControl(Control& control);
     bool ReadBlock(uint8_t& size);
     bool SkipBlocks();
-    bool ReadDescriptor(const Control& control, CGIFImage& image);
-    bool ReadPixels(bool isInterlaced, CGIFImage& image);
+    bool ReadDescriptor(const Control& control, GIFImage& image);
+    bool ReadPixels(bool isInterlaced, GIFImage& image);
 
-    CPicInput& m_kInput;
+    CPicInput& input_;
     Palette m_kPalette{};
     int m_iScreenWidth = 0;
     int m_iScreenHeight = 0;

@@ -27,7 +27,7 @@ std::FILE* BinaryInput()
 
 bool IsStandardStream(const std::string& fileName)
 {
-    const CPathParts parts = SplitPath(fileName);
+    const PathParts parts = SplitPath(fileName);
     return parts.folder.empty() && parts.stem == "-";
 }
 

@@ -8,24 +8,24 @@
 namespace gw {
 
 /// A pixel of four bytes, in memory red first.
-struct CPixelRGBA
+struct PixelRGBA
 {
     uint8_t r;
     uint8_t g;
     uint8_t b;
     uint8_t a;
 
-    friend bool operator==(const CPixelRGBA&, const CPixelRGBA&) = default;
+    friend bool operator==(const PixelRGBA&, const PixelRGBA&) = default;
 };
 
 /// The brightness of a pixel, for pictures of one channel.
-inline uint8_t Brightness(const CPixelRGBA& pixel)
+inline uint8_t Brightness(const PixelRGBA& pixel)
 {
     return static_cast<uint8_t>((77 * pixel.r + 150 * pixel.g + 29 * pixel.b) >> 8);
 }
 
 /// Where a picture has pixels: columns from x on, rows from y on.
-struct CPictureBox
+struct PictureBox
 {
     int x = 0;
     int y = 0;
@@ -51,22 +51,22 @@ public:
     virtual bool Close() { return true; }
 
     virtual int ChannelCount() const = 0;
-    virtual CPictureBox Box() const = 0;
+    virtual PictureBox Box() const = 0;
     /// Whether row 0 is the bottom of the picture.
     virtual bool IsBottomFirst() const { return false; }
     virtual bool ReadRow(int y, int x, int count, uint8_t* pixels) = 0;
-    virtual bool ReadRowRGBA(int y, int x, int count, CPixelRGBA* pixels) = 0;
+    virtual bool ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels) = 0;
     /// Goes on to the next picture in the file; false where there is none.
     virtual bool NextPicture() { return false; }
 
     virtual bool SetChannelCount(int) { return false; }
-    virtual bool SetSize(const CPictureBox&) { return false; }
+    virtual bool SetSize(const PictureBox&) { return false; }
     virtual bool WriteRow(int, int, int, const uint8_t*) { return false; }
-    virtual bool WriteRowRGBA(int, int, int, const CPixelRGBA*) { return false; }
+    virtual bool WriteRowRGBA(int, int, int, const PixelRGBA*) { return false; }
 
 protected:
     /// Whether a row's pixels lie inside a picture of this size.
-    static bool IsInside(int y, int x, int count, const CPictureBox& box)
+    static bool IsInside(int y, int x, int count, const PictureBox& box)
     {
         return y >= 0 && y < box.height && x >= 0 && count >= 0 && x <= box.width - count;
     }

@@ -32,16 +32,16 @@ constexpr PicProcs ProcsOf(const char* name, CPicture* (*open)(const char* fileN
         .close = Close,
         .getName = [](const CPicture* picture) { return picture->Name().c_str(); },
         .clear = [](CPicture*, uint8_t) {},
-        .clearRGBA = [](CPicture*, const CPixelRGBA&) {},
+        .clearRGBA = [](CPicture*, const PixelRGBA&) {},
         .setChannelCount = [](CPicture* picture, int count) { return picture->SetChannelCount(count); },
-        .setSize = [](CPicture* picture, const CPictureBox& box) { return picture->SetSize(box); },
+        .setSize = [](CPicture* picture, const PictureBox& box) { return picture->SetSize(box); },
         .writePixel = [](CPicture* picture, int, int, uint8_t) { TellUnsupported(picture, "write_pixel"); },
         .writePixelRGBA = [](CPicture* picture, int, int,
-                             const CPixelRGBA&) { TellUnsupported(picture, "write_pixel_rgba"); },
+                             const PixelRGBA&) { TellUnsupported(picture, "write_pixel_rgba"); },
         .writeRow = [](CPicture* picture, int y, int x, int count,
                        const uint8_t* pixels) { return picture->WriteRow(y, x, count, pixels); },
         .writeRowRGBA = [](CPicture* picture, int y, int x, int count,
-                           const CPixelRGBA* pixels) { return picture->WriteRowRGBA(y, x, count, pixels); },
+                           const PixelRGBA* pixels) { return picture->WriteRowRGBA(y, x, count, pixels); },
         .getChannelCount = [](const CPicture* picture) { return picture->ChannelCount(); },
         .getBox = [](const CPicture* picture) { return picture->Box(); },
         .readPixel =
@@ -52,12 +52,12 @@ constexpr PicProcs ProcsOf(const char* name, CPicture* (*open)(const char* fileN
         .readPixelRGBA =
             [](CPicture* picture, int, int) {
                 TellUnsupported(picture, "read_pixel_rgba");
-                return CPixelRGBA{};
+                return PixelRGBA{};
             },
         .readRow = [](CPicture* picture, int y, int x, int count,
                       uint8_t* pixels) { return picture->ReadRow(y, x, count, pixels); },
         .readRowRGBA = [](CPicture* picture, int y, int x, int count,
-                          CPixelRGBA* pixels) { return picture->ReadRowRGBA(y, x, count, pixels); },
+                          PixelRGBA* pixels) { return picture->ReadRowRGBA(y, x, count, pixels); },
         .nextPicture = [](CPicture* picture) { return picture->NextPicture(); },
         .name = name,
     };

@@ -14,20 +14,20 @@ struct PicProcs
     CPicture* (*open)(const char* fileName, const char* mode);
     bool (*close)(CPicture* picture);
     const char* (*getName)(const CPicture* picture);
-    void (*clear)(CPicture* picture, uint8_t pixel);               ///< does nothing
-    void (*clearRGBA)(CPicture* picture, const CPixelRGBA& pixel); ///< does nothing
+    void (*clear)(CPicture* picture, uint8_t pixel);              ///< does nothing
+    void (*clearRGBA)(CPicture* picture, const PixelRGBA& pixel); ///< does nothing
     bool (*setChannelCount)(CPicture* picture, int count);
-    bool (*setSize)(CPicture* picture, const CPictureBox& box);
+    bool (*setSize)(CPicture* picture, const PictureBox& box);
     void (*writePixel)(CPicture* picture, int x, int y, uint8_t pixel); ///< no driver can
-    void (*writePixelRGBA)(CPicture* picture, int x, int y, const CPixelRGBA& pixel);
+    void (*writePixelRGBA)(CPicture* picture, int x, int y, const PixelRGBA& pixel);
     bool (*writeRow)(CPicture* picture, int y, int x, int count, const uint8_t* pixels);
-    bool (*writeRowRGBA)(CPicture* picture, int y, int x, int count, const CPixelRGBA* pixels);
+    bool (*writeRowRGBA)(CPicture* picture, int y, int x, int count, const PixelRGBA* pixels);
     int (*getChannelCount)(const CPicture* picture);
-    CPictureBox (*getBox)(const CPicture* picture);
+    PictureBox (*getBox)(const CPicture* picture);
     uint8_t (*readPixel)(CPicture* picture, int x, int y); ///< no driver can
-    CPixelRGBA (*readPixelRGBA)(CPicture* picture, int x, int y);
+    PixelRGBA (*readPixelRGBA)(CPicture* picture, int x, int y);
     bool (*readRow)(CPicture* picture, int y, int x, int count, uint8_t* pixels);
-    bool (*readRowRGBA)(CPicture* picture, int y, int x, int count, CPixelRGBA* pixels);
+    bool (*readRowRGBA)(CPicture* picture, int y, int x, int count, PixelRGBA* pixels);
     bool (*nextPicture)(CPicture* picture);
     const char* name;
 };

@@ -34,37 +34,37 @@ bool IsNoNumber(ENumber kind)
 
 bool CBVHHierarchyReader::Fail(EFailure reason, std::string_view name)
 {
-    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
+    return record_.Fail(reason, lines_.LineNumber(), Quote(name));
 }
 
 bool CBVHHierarchyReader::Read()
 {
-    m_kFile.root = std::make_unique<TKBVHJoint>();
-    m_kFile.root->name = "Global";
-    m_kFile.jointCount = 0;
-    m_kFile.nodeCount = 0;
-    for (std::string_view rest; m_kLines.Next(rest);)
+    file_.root = std::make_unique<TKBVHJoint>();
+    file_.root->name = "Global";
+    file_.jointCount = 0;
+    file_.nodeCount = 0;
+    for (std::string_view rest; lines_.Next(rest);)
     {
         const std::string_view keyword = NextToken(rest);
         if (keyword == "MOTION")
         {
-            m_kLines.StepBack();
+            lines_.StepBack();
             return true;
         }
-        if (keyword == "ROOT" && !ReadJoint(m_kFile.root->AddChild(EJointKind::Root), rest, 1))
+        if (keyword == "ROOT" && !ReadJoint(file_.root->AddChild(EJointKind::Root), rest, 1))
             return false;
         if (keyword == "JOINT" && !ReadTopJoint(rest))
             return false;
     }
     if (m_uiSwallowedMotion > 0)
-        return m_kRecord.Fail(EFailure::BadBrace, m_uiSwallowedMotion, "}");
+        return record_.Fail(EFailure::BadBrace, m_uiSwallowedMotion, "}");
     return Fail(EFailure::MissingSection, "MOTION");
 }
 
 // A joint outside all blocks belongs to the first root.
 bool CBVHHierarchyReader::ReadTopJoint(std::string_view rest)
 {
-    TKBVHJoint* const root = m_kFile.FirstRoot();
+    TKBVHJoint* const root = file_.FirstRoot();
     if (!root)
         return Fail(EFailure::NoRoot, NextToken(rest));
     return ReadJoint(root->AddChild(EJointKind::Joint), rest, 2);
@@ -77,9 +77,9 @@ bool CBVHHierarchyReader::ReadJoint(TKBVHJoint& joint, std::string_view rest, si
     // A bone mesh nests one level deeper than its joint.
     if (depth >= kNestingLimit)
         return Fail(EFailure::TooDeep, joint.name);
-    if (++m_kFile.jointCount > kBoneLimit)
+    if (++file_.jointCount > kBoneLimit)
         return Fail(EFailure::TooLarge, joint.name);
-    m_kFile.nodeCount += joint.MakesNode() ? 1 : 0;
+    file_.nodeCount += joint.MakesNode() ? 1 : 0;
     return ReadBody(joint, depth);
 }
 
@@ -91,7 +91,7 @@ bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
     // A brace that stands here is missed below, which is worth more words than a name of two.
     const std::string_view more = NextToken(rest);
     if (!more.empty() && more != "{")
-        m_kRecord.Warn(EFailure::CutName, m_kLines.LineNumber(), joint.name);
+        record_.Warn(EFailure::CutName, lines_.LineNumber(), joint.name);
     return true;
 }
 
@@ -99,7 +99,7 @@ bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
 bool CBVHHierarchyReader::ReadBody(TKBVHJoint& joint, size_t depth)
 {
     bool open = false;
-    for (std::string_view rest; m_kLines.Next(rest);)
+    for (std::string_view rest; lines_.Next(rest);)
     {
         const std::string_view keyword = NextToken(rest);
         if (keyword == "}")
@@ -125,7 +125,7 @@ bool CBVHHierarchyReader::ReadBodyLine(TKBVHJoint& joint, std::string_view keywo
     if (keyword == "CHANNELS")
         return ReadChannels(joint, rest);
     if (keyword == "MOTION" && m_uiSwallowedMotion == 0)
-        m_uiSwallowedMotion = m_kLines.LineNumber();
+        m_uiSwallowedMotion = lines_.LineNumber();
     return true;
 }
 
@@ -141,7 +141,7 @@ bool CBVHHierarchyReader::ReadOffset(TKBVHJoint& joint, std::string_view rest)
         if (IsNoNumber(kind))
             return Fail(EFailure::BadNumber, token);
         if (kind == ENumber::Stuck)
-            m_kRecord.Warn(EFailure::StuckNumber, m_kLines.LineNumber(), Quote(token));
+            record_.Warn(EFailure::StuckNumber, lines_.LineNumber(), Quote(token));
     }
     return true;
 }
@@ -163,7 +163,7 @@ bool CBVHHierarchyReader::ReadChannels(TKBVHJoint& joint, std::string_view rest)
         if (known != std::end(kChannelNames))
             joint.channels.push_back(static_cast<int>(known - std::begin(kChannelNames)));
         else
-            m_kRecord.Warn(EFailure::UnknownChannel, m_kLines.LineNumber(), Quote(channel));
+            record_.Warn(EFailure::UnknownChannel, lines_.LineNumber(), Quote(channel));
     }
     return true;
 }

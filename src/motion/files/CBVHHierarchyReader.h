@@ -17,7 +17,7 @@ class CBVHHierarchyReader
 {
 public:
     CBVHHierarchyReader(CTextLines& lines, TKBVHFile& file, CFailureRecord& record)
-        : m_kLines(lines), m_kFile(file), m_kRecord(record)
+        : lines_(lines), file_(file), record_(record)
     {
     }
 
@@ -35,9 +35,9 @@ private:
     bool ReadChannels(TKBVHJoint& joint, std::string_view rest);
     bool Fail(EFailure reason, std::string_view name);
 
-    CTextLines& m_kLines;
-    TKBVHFile& m_kFile;
-    CFailureRecord& m_kRecord;
+    CTextLines& lines_;
+    TKBVHFile& file_;
+    CFailureRecord& record_;
     size_t m_uiSwallowedMotion = 0; // a line "MOTION" inside a block that is not closed
 };
 

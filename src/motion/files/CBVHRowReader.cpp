@@ -78,7 +78,7 @@ bool HasPositions(const TKBVHJoint& joint)
 } // namespace
 
 CBVHRowReader::CBVHRowReader(TKBVHJoint& root, CFailureRecord& record)
-    : m_kRecord(record), m_uiRootValues(std::max<size_t>(root.channels.size(), 1)), m_iProbes(kProbeRows)
+    : record_(record), m_uiRootValues(std::max<size_t>(root.channels.size(), 1)), m_iProbes(kProbeRows)
 {
     // The root takes a value also where it has no channels.
     if (root.channels.empty())
@@ -179,22 +179,22 @@ bool CBVHRowReader::JudgeToken(std::string_view token, size_t index)
     else
         ScanFloat(token, value, kind);
     if (kind == ENumber::None || kind == ENumber::Unusual || !std::isfinite(value))
-        return m_kRecord.Fail(EFailure::BadNumber, m_uiLine, Quote(token));
+        return record_.Fail(EFailure::BadNumber, m_uiLine, Quote(token));
     if (kind == ENumber::Stuck)
-        m_kRecord.Warn(EFailure::StuckNumber, m_uiLine, Quote(token));
+        record_.Warn(EFailure::StuckNumber, m_uiLine, Quote(token));
     return true;
 }
 
 bool CBVHRowReader::CheckLength(bool blank)
 {
     if (blank)
-        return m_kRecord.Fail(EFailure::BlankLine, m_uiLine);
+        return record_.Fail(EFailure::BlankLine, m_uiLine);
     const auto lacks = [this](const Column& c) { return c.first + c.joint->channels.size() > m_uiValues; };
     const auto column = std::ranges::find_if(m_kColumns, lacks);
     const std::string name = column == m_kColumns.end() ? std::string() : column->joint->name;
     if (m_uiValues < m_uiRootValues)
-        return m_kRecord.Fail(EFailure::MissingTokens, m_uiLine, name);
-    m_kRecord.Warn(EFailure::ShortRow, m_uiLine, name);
+        return record_.Fail(EFailure::MissingTokens, m_uiLine, name);
+    record_.Warn(EFailure::ShortRow, m_uiLine, name);
     return true;
 }
 
@@ -254,7 +254,7 @@ void CBVHRowReader::LookForDoubledOffsets()
     }
     if (repeating.empty() || repeating.size() * 2 < candidates)
         return;
-    m_kRecord.Warn(EFailure::DoubledOffsets, m_uiLine, repeating[0]->name);
+    record_.Warn(EFailure::DoubledOffsets, m_uiLine, repeating[0]->name);
     m_iProbes = 0;
 }
 

@@ -45,7 +45,7 @@ private:
     void FillLastKeys();
     void LookForDoubledOffsets();
 
-    CFailureRecord& m_kRecord;
+    CFailureRecord& record_;
     std::vector<Column> m_kColumns;
     std::vector<float> m_kRow; // the values of one row
     size_t m_uiValues = 0;     // how many of them the row at hand had

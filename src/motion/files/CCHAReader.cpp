@@ -53,17 +53,17 @@ const CCHAReader::HandlerRow CCHAReader::kHandlers[] = {
 
 bool CCHAReader::Fail(EFailure reason, std::string_view name)
 {
-    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
+    return record_.Fail(reason, lines_.LineNumber(), Quote(name));
 }
 
 void CCHAReader::Warn(EFailure reason, std::string_view name)
 {
-    m_kRecord.Warn(reason, m_kLines.LineNumber(), Quote(name));
+    record_.Warn(reason, lines_.LineNumber(), Quote(name));
 }
 
 bool CCHAReader::Read()
 {
-    for (std::string_view rest; m_kLines.Next(rest);)
+    for (std::string_view rest; lines_.Next(rest);)
     {
         const std::string_view word = NextToken(rest);
         if (word.empty() && m_uiOpenHeaders == 0)
@@ -85,7 +85,7 @@ bool CCHAReader::ReadWord(std::string_view word, std::string_view rest)
     if (section != std::end(kHandlers))
         return (this->*section->read)();
     const auto key = std::ranges::find(kKeys, word, &KeyRow::name);
-    return key == std::end(kKeys) || ReadKey(word, m_kFile.*key->field, rest);
+    return key == std::end(kKeys) || ReadKey(word, file_.*key->field, rest);
 }
 
 // A key without a value is as good as a missing one: its field keeps the default.
@@ -99,9 +99,9 @@ bool CCHAReader::ReadKey(std::string_view key, int& field, std::string_view rest
     }
     if (!ScanInt(token, field))
         return Fail(EFailure::BadNumber, token);
-    if (m_kFile.numSegments > kSegmentLimit)
+    if (file_.numSegments > kSegmentLimit)
         return Fail(EFailure::TooLarge, key);
-    return m_kFile.beginFrame >= 0 || Fail(EFailure::BadNumber, token);
+    return file_.beginFrame >= 0 || Fail(EFailure::BadNumber, token);
 }
 
 bool CCHAReader::OpenHeader()
@@ -113,17 +113,17 @@ bool CCHAReader::OpenHeader()
 void CCHAReader::CloseHeader()
 {
     --m_uiOpenHeaders;
-    m_kFile.CountFrames();
+    file_.CountFrames();
 }
 
 // The next line that is no remark. False, with the cursor before it, where a section begins.
 bool CCHAReader::NextSectionLine(std::string_view& line)
 {
-    while (m_kLines.Next(line))
+    while (lines_.Next(line))
     {
         if (line.starts_with('['))
         {
-            m_kLines.StepBack();
+            lines_.StepBack();
             return false;
         }
         if (!IsRemark(line))
@@ -155,13 +155,13 @@ bool CCHAReader::ReadLength(std::string_view line)
     ENumber kind;
     if (!ScanFloat(number, length, kind) || kind == ENumber::Unusual)
         return Fail(EFailure::BadNumber, number);
-    m_kFile.lengths.emplace_back(name, length);
+    file_.lengths.emplace_back(name, length);
     return true;
 }
 
 bool CCHAReader::ReadHierarchy()
 {
-    m_kFile.MakeRoot();
+    file_.MakeRoot();
     bool allCount = true;
     for (std::string_view line; NextSectionLine(line);)
     {
@@ -170,7 +170,7 @@ bool CCHAReader::ReadHierarchy()
     }
     if (!allCount)
         Warn(EFailure::BadCount, "NumSegments");
-    m_kFile.LinkSegments(m_kRecord, m_kLines.LineNumber());
+    file_.LinkSegments(record_, lines_.LineNumber());
     return true;
 }
 
@@ -181,23 +181,23 @@ bool CCHAReader::AddSegment(std::string_view line, bool& counts)
     const std::string_view parentName = NextWord(line);
     if (!MayBeName(name) || !MayBeName(parentName))
         return Fail(EFailure::BadName, name);
-    counts = std::ssize(m_kFile.segments) < m_kFile.numSegments;
+    counts = std::ssize(file_.segments) < file_.numSegments;
     if (counts)
-        m_kFile.AddSegment(name, parentName);
+        file_.AddSegment(name, parentName);
     return true;
 }
 
 bool CCHAReader::ReadMotion()
 {
     m_bHasMotion = true;
-    if (!m_kFile.FirstRoot())
+    if (!file_.FirstRoot())
         return CheckFile(EFailure::MissingSection);
-    if (m_uiOpenHeaders > 0 && m_kFile.frameCount == 0)
+    if (m_uiOpenHeaders > 0 && file_.frameCount == 0)
         Warn(EFailure::OpenHeader, "[HEADER]");
     if (!ReservePlaces())
         return Fail(EFailure::TooFewRows, "EndFrame");
     size_t index = 0;
-    for (std::string_view line; m_kLines.Next(line);)
+    for (std::string_view line; lines_.Next(line);)
     {
         if (IsRemark(line))
             continue;
@@ -205,24 +205,24 @@ bool CCHAReader::ReadMotion()
             index = 0;
         else if (!ReadRow(index++, line))
             return false;
-        m_kLines.ForgetRead();
+        lines_.ForgetRead();
     }
     return TakeFrames();
 }
 
 std::span<CCHAReader::Place> CCHAReader::CountedPlaces()
 {
-    return std::span(m_kPlaces).first(static_cast<size_t>(std::max(m_kFile.numSegments, 0)));
+    return std::span(m_kPlaces).first(static_cast<size_t>(std::max(file_.numSegments, 0)));
 }
 
 // Makes room for the frames. False where the bytes that remain cannot hold as many rows.
 bool CCHAReader::ReservePlaces()
 {
-    const auto frames = static_cast<size_t>(m_kFile.frameCount);
+    const auto frames = static_cast<size_t>(file_.frameCount);
     if (frames == 0)
         return true;
-    const size_t needed = static_cast<size_t>(m_kFile.beginFrame) + frames;
-    if (needed > (m_kLines.BytesLeft() + 1) / kBytesPerRow / std::max<size_t>(CountedPlaces().size(), 1))
+    const size_t needed = static_cast<size_t>(file_.beginFrame) + frames;
+    if (needed > (lines_.BytesLeft() + 1) / kBytesPerRow / std::max<size_t>(CountedPlaces().size(), 1))
         return false;
     for (Place& place : CountedPlaces())
     {
@@ -250,9 +250,9 @@ bool CCHAReader::ReadRow(size_t index, std::string_view line)
     // last thing there is.
     if (count > 0 || place.rowCount == 0)
         place.segment.name = name;
-    const auto begin = static_cast<size_t>(m_kFile.beginFrame);
+    const auto begin = static_cast<size_t>(file_.beginFrame);
     const size_t row = place.rowCount++;
-    if (!counts || row < begin || row - begin >= static_cast<size_t>(m_kFile.frameCount))
+    if (!counts || row < begin || row - begin >= static_cast<size_t>(file_.frameCount))
         return true;
     place.segment.matrices.emplace_back();
     std::copy_n(place.row.data(), 9, place.segment.matrices.back().m);
@@ -287,14 +287,14 @@ bool CCHAReader::TakeFrames()
 {
     for (Place& place : CountedPlaces())
     {
-        const auto frames = static_cast<size_t>(m_kFile.frameCount);
-        if (frames > 0 && place.rowCount < static_cast<size_t>(m_kFile.beginFrame) + frames)
+        const auto frames = static_cast<size_t>(file_.frameCount);
+        if (frames > 0 && place.rowCount < static_cast<size_t>(file_.beginFrame) + frames)
             return Fail(EFailure::TooFewRows, place.segment.name);
         TakeFrames(place);
     }
-    for (const auto& segment : m_kFile.segments)
+    for (const auto& segment : file_.segments)
     {
-        if (m_kFile.frameCount > 0 && segment->matrices.empty() && m_kFile.FindSegment(segment->name))
+        if (file_.frameCount > 0 && segment->matrices.empty() && file_.FindSegment(segment->name))
             Warn(EFailure::TooFewRows, segment->name);
     }
     return true;
@@ -302,7 +302,7 @@ bool CCHAReader::TakeFrames()
 
 void CCHAReader::TakeFrames(Place& place)
 {
-    TKCHSegment* const segment = m_kFile.FindSegment(place.segment.name);
+    TKCHSegment* const segment = file_.FindSegment(place.segment.name);
     if (segment && segment->matrices.empty())
     {
         segment->matrices = std::move(place.segment.matrices);
@@ -314,13 +314,13 @@ void CCHAReader::TakeFrames(Place& place)
 
 bool CCHAReader::CheckFile(EFailure end)
 {
-    if (!m_kFile.root)
+    if (!file_.root)
         return Fail(end, "[HIERARCHY]");
-    if (!m_kFile.FirstRoot())
-        return Fail(EFailure::NoRoot, m_kFile.numSegments > 0 ? "Global" : "NumSegments");
+    if (!file_.FirstRoot())
+        return Fail(EFailure::NoRoot, file_.numSegments > 0 ? "Global" : "NumSegments");
     if (!m_bHasMotion)
         return Fail(EFailure::MissingSection, "[MOTION]");
-    return KeyTimesFit(m_kFile.frameCount, m_kFile.segments.size(), m_kLines.ByteCount()) ||
+    return KeyTimesFit(file_.frameCount, file_.segments.size(), lines_.ByteCount()) ||
            Fail(EFailure::BadCount, "EndFrame");
 }
 

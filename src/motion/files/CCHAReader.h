@@ -20,7 +20,7 @@ class CCHAReader
 {
 public:
     CCHAReader(CTextLines& lines, TKCHFile& file, CFailureRecord& record)
-        : m_kLines(lines), m_kFile(file), m_kRecord(record), m_kPlaces(kSegmentLimit)
+        : lines_(lines), file_(file), record_(record), m_kPlaces(kSegmentLimit)
     {
     }
 
@@ -69,9 +69,9 @@ private:
     bool Fail(EFailure reason, std::string_view name);
     void Warn(EFailure reason, std::string_view name);
 
-    CTextLines& m_kLines;
-    TKCHFile& m_kFile;
-    CFailureRecord& m_kRecord;
+    CTextLines& lines_;
+    TKCHFile& file_;
+    CFailureRecord& record_;
     size_t m_uiOpenHeaders = 0; // a header may stand in a header, and each takes a blank line of its own
     bool m_bHasMotion = false;
     std::vector<Place> m_kPlaces;

@@ -18,7 +18,7 @@ namespace {
 
 constexpr std::string_view kEndSection = "[EndOfFile]"; // closes files of other programs
 
-bool TakeValue(std::string_view token, TKHTRFile& file, const CHTRText& field)
+bool TakeValue(std::string_view token, TKHTRFile& file, const HTRText& field)
 {
     file.*field.text = token.substr(0, field.size - 1);
     return true;
@@ -50,17 +50,17 @@ const CHTRReader::HandlerRow CHTRReader::kHandlers[] = {
 
 bool CHTRReader::Fail(EFailure reason, std::string_view name)
 {
-    return m_kRecord.Fail(reason, m_kLines.LineNumber(), Quote(name));
+    return record_.Fail(reason, lines_.LineNumber(), Quote(name));
 }
 
 void CHTRReader::Warn(EFailure reason, std::string_view name)
 {
-    m_kRecord.Warn(reason, m_kLines.LineNumber(), Quote(name));
+    record_.Warn(reason, lines_.LineNumber(), Quote(name));
 }
 
 bool CHTRReader::Read()
 {
-    for (std::string_view line; m_kLines.Next(line);)
+    for (std::string_view line; lines_.Next(line);)
     {
         if (line.starts_with('[') && !ReadSection(NextToken(line)))
             return false;
@@ -84,11 +84,11 @@ bool CHTRReader::ReadSection(std::string_view section)
 // begins.
 bool CHTRReader::NextSectionLine(std::string_view& line)
 {
-    while (m_kLines.Next(line))
+    while (lines_.Next(line))
     {
         if (line.starts_with('['))
         {
-            m_kLines.StepBack();
+            lines_.StepBack();
             return false;
         }
         std::string_view words = line;
@@ -100,12 +100,12 @@ bool CHTRReader::NextSectionLine(std::string_view& line)
 
 bool CHTRReader::ReadHeader(std::string_view)
 {
-    for (std::string_view rest; m_kLines.Next(rest);)
+    for (std::string_view rest; lines_.Next(rest);)
     {
         const std::string_view key = NextToken(rest);
         if (key.starts_with('['))
         {
-            m_kLines.StepBack();
+            lines_.StepBack();
             return true;
         }
         if (!ReadKey(key, rest))
@@ -117,7 +117,7 @@ bool CHTRReader::ReadHeader(std::string_view)
 // A key without a value is as good as a missing one: its field keeps the default.
 bool CHTRReader::ReadKey(std::string_view key, std::string_view rest)
 {
-    const auto known = std::ranges::find(kHTRKeys, key, &CHTRKey::name);
+    const auto known = std::ranges::find(kHTRKeys, key, &HTRKey::name);
     if (known == std::end(kHTRKeys))
         return true;
     const std::string_view token = NextToken(rest);
@@ -127,16 +127,16 @@ bool CHTRReader::ReadKey(std::string_view key, std::string_view rest)
         return true;
     }
     if (key == "NumFrames")
-        m_uiFramesLine = m_kLines.LineNumber();
-    const auto take = [&](const auto& field) { return TakeValue(token, m_kFile, field); };
+        m_uiFramesLine = lines_.LineNumber();
+    const auto take = [&](const auto& field) { return TakeValue(token, file_, field); };
     return std::visit(take, known->field) || Fail(EFailure::BadNumber, token);
 }
 
 bool CHTRReader::ReadHierarchy(std::string_view)
 {
-    m_kFile.segmentOfName.clear();
-    m_kFile.segments.clear();
-    m_kFile.root = m_kFile.segments.emplace_back(std::make_unique<TKHTRSegment>()).get();
+    file_.segmentOfName.clear();
+    file_.segments.clear();
+    file_.root = file_.segments.emplace_back(std::make_unique<TKHTRSegment>()).get();
     for (std::string_view line; NextSectionLine(line);)
     {
         if (!AddSegment(line))
@@ -152,13 +152,13 @@ bool CHTRReader::AddSegment(std::string_view line)
     const std::string_view parentName = NextWord(line);
     if (!MayBeName(name) || !MayBeName(parentName))
         return Fail(EFailure::BadName, name);
-    if (m_kFile.segments.size() > kBoneLimit)
+    if (file_.segments.size() > kBoneLimit)
         return Fail(EFailure::TooLarge, name);
     auto segment = std::make_unique<TKHTRSegment>();
     segment->name = name;
     segment->parentName = parentName;
-    segment->line = m_kLines.LineNumber();
-    m_kFile.segments.push_back(std::move(segment));
+    segment->line = lines_.LineNumber();
+    file_.segments.push_back(std::move(segment));
     return true;
 }
 
@@ -167,33 +167,33 @@ bool CHTRReader::AddSegment(std::string_view line)
 void CHTRReader::LinkSegments()
 {
     std::unordered_map<std::string_view, TKHTRSegment*> segmentOfName{
-        {"GLOBAL", m_kFile.root}
+        {"GLOBAL", file_.root}
     };
-    for (size_t i = 1; i < m_kFile.segments.size(); ++i)
-        segmentOfName.emplace(m_kFile.segments[i]->name, m_kFile.segments[i].get());
-    const size_t listed = m_kFile.segments.size() - 1;
-    const size_t counted = std::min(static_cast<size_t>(std::max(m_kFile.numSegments, 0)), listed);
+    for (size_t i = 1; i < file_.segments.size(); ++i)
+        segmentOfName.emplace(file_.segments[i]->name, file_.segments[i].get());
+    const size_t listed = file_.segments.size() - 1;
+    const size_t counted = std::min(static_cast<size_t>(std::max(file_.numSegments, 0)), listed);
     for (size_t i = 1; i <= counted; ++i)
     {
-        TKHTRSegment& segment = *m_kFile.segments[i];
+        TKHTRSegment& segment = *file_.segments[i];
         const auto parent = segmentOfName.find(segment.parentName);
         if (parent == segmentOfName.end())
         {
-            m_kRecord.Warn(EFailure::UnknownSegment, segment.line, segment.parentName);
+            record_.Warn(EFailure::UnknownSegment, segment.line, segment.parentName);
             continue;
         }
         parent->second->children.push_back(&segment);
         m_kSegmentSections.insert("[" + segment.name + "]");
     }
     if (counted < listed)
-        m_kRecord.Warn(EFailure::BadCount, m_kFile.segments[counted + 1]->line, "NumSegments");
+        record_.Warn(EFailure::BadCount, file_.segments[counted + 1]->line, "NumSegments");
 }
 
 // Depth first, so that a name means the segment that a search from the root finds.
 bool CHTRReader::IndexSegments()
 {
     std::vector<std::pair<TKHTRSegment*, size_t>> waiting{
-        {m_kFile.root, 0}
+        {file_.root, 0}
     };
     while (!waiting.empty())
     {
@@ -201,9 +201,9 @@ bool CHTRReader::IndexSegments()
         waiting.pop_back();
         // A bone mesh nests one level deeper than its segment.
         if (depth >= kNestingLimit)
-            return m_kRecord.Fail(EFailure::TooDeep, segment->line, segment->name);
+            return record_.Fail(EFailure::TooDeep, segment->line, segment->name);
         if (depth > 0)
-            m_kFile.segmentOfName.emplace(segment->name, segment);
+            file_.segmentOfName.emplace(segment->name, segment);
         for (auto child = segment->children.rbegin(); child != segment->children.rend(); ++child)
             waiting.emplace_back(*child, depth + 1);
     }
@@ -212,25 +212,25 @@ bool CHTRReader::IndexSegments()
 
 bool CHTRReader::CheckFile()
 {
-    if (!m_kFile.root)
+    if (!file_.root)
         return Fail(EFailure::MissingSection, "[SegmentNames&Hierarchy]");
-    if (!m_kFile.FirstRoot())
-        return Fail(EFailure::NoRoot, m_kFile.numSegments > 0 ? "GLOBAL" : "NumSegments");
-    if (!KeyTimesFit(m_kFile.numFrames, m_kFile.segmentOfName.size(), m_kLines.ByteCount()))
-        return m_kRecord.Fail(EFailure::BadCount, m_uiFramesLine, "NumFrames");
+    if (!file_.FirstRoot())
+        return Fail(EFailure::NoRoot, file_.numSegments > 0 ? "GLOBAL" : "NumSegments");
+    if (!KeyTimesFit(file_.numFrames, file_.segmentOfName.size(), lines_.ByteCount()))
+        return record_.Fail(EFailure::BadCount, m_uiFramesLine, "NumFrames");
     WarnOfMissingRows();
     return true;
 }
 
 void CHTRReader::WarnOfMissingRows()
 {
-    for (const auto& segment : m_kFile.segments)
+    for (const auto& segment : file_.segments)
     {
         const auto rows = static_cast<int64_t>(segment->scales.size());
-        if (rows >= m_kFile.numFrames || !m_kFile.segmentOfName.contains(segment->name))
+        if (rows >= file_.numFrames || !file_.segmentOfName.contains(segment->name))
             continue;
         const EFailure reason = rows > 0 ? EFailure::TooFewRows : EFailure::MissingSection;
-        m_kRecord.Warn(reason, segment->line, segment->name);
+        record_.Warn(reason, segment->line, segment->name);
     }
 }
 

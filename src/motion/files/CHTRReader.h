@@ -21,7 +21,7 @@ class CHTRReader
 {
 public:
     CHTRReader(CTextLines& lines, TKHTRFile& file, CFailureRecord& record)
-        : m_kLines(lines), m_kFile(file), m_kRecord(record)
+        : lines_(lines), file_(file), record_(record)
     {
     }
 
@@ -59,9 +59,9 @@ private:
     bool Fail(EFailure reason, std::string_view name);
     void Warn(EFailure reason, std::string_view name);
 
-    CTextLines& m_kLines;
-    TKHTRFile& m_kFile;
-    CFailureRecord& m_kRecord;
+    CTextLines& lines_;
+    TKHTRFile& file_;
+    CFailureRecord& record_;
     std::set<std::string, std::less<>> m_kSegmentSections; // "[name]" of each segment that has a parent
     size_t m_uiFramesLine = 0;                             // of the key "NumFrames"
 };

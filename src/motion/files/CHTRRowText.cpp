@@ -54,7 +54,7 @@ char* CHTRRowText::WriteScale(char* out, float scale)
     return out + m_uiScale;
 }
 
-void CHTRRowText::Write(CLineWriter& out, int number, const CHTRRow& row)
+void CHTRRowText::Write(CLineWriter& out, int number, const HTRRow& row)
 {
     char* const end = WriteScale(WriteColumns(WriteTranslation(row.translation), row.degrees), row.scale);
     m_uiText = static_cast<size_t>(end - m_acText);

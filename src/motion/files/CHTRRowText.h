@@ -10,7 +10,7 @@ namespace gw {
 class CLineWriter;
 
 /// One row of a segment in a file: what a node's pose is relative to its base pose.
-struct CHTRRow
+struct HTRRow
 {
     Vec3 translation = kVec3Zero;
     Vec3 degrees = kVec3Zero;
@@ -23,7 +23,7 @@ class CHTRRowText
 {
 public:
     /// "number Tx Ty Tz Rx Ry Rz SF" as a line. A value that is not finite is written as 0.
-    void Write(CLineWriter& out, int number, const CHTRRow& row);
+    void Write(CLineWriter& out, int number, const HTRRow& row);
     /// The last row once more, under another number.
     void Repeat(CLineWriter& out, int number) const;
 
@@ -33,7 +33,7 @@ private:
     char* WriteTranslation(const Vec3& translation);
     char* WriteScale(char* out, float scale);
 
-    CHTRRow m_kLast;
+    HTRRow m_kLast;
     bool m_bHasLast = false;
     // The last row from the blank after its number to its line end, and the lengths of its first part and its
     // last.

@@ -18,7 +18,7 @@ bool StandsAlone(const CControl& control, const CNode& node)
 } // namespace
 
 CMotionSampler::CMotionSampler(CNode& root)
-    : m_kRoot(root), m_kNodes(NodesOf(root)), m_kTracks(m_kNodes.size()), m_bPosesNodes(FindTracks())
+    : root_(root), m_kNodes(NodesOf(root)), m_kTracks(m_kNodes.size()), m_bPosesNodes(FindTracks())
 {
 }
 
@@ -26,7 +26,7 @@ CMotionSampler::CMotionSampler(CNode& root)
 bool CMotionSampler::FindTracks()
 {
     std::vector<CObject*> controls;
-    m_kRoot.FindObjects(controls, nullptr, &CControl::ms_kRTTI, true);
+    root_.FindObjects(controls, nullptr, &CControl::ms_kRTTI, true);
     size_t trackCount = 0;
     for (size_t i = 0; i < m_kNodes.size(); ++i)
     {
@@ -50,7 +50,7 @@ void CMotionSampler::PoseNode(size_t index, float time)
 void CMotionSampler::PoseTree(float time)
 {
     if (!m_bPosesNodes)
-        return m_kRoot.UpdateScene(time, true);
+        return root_.UpdateScene(time, true);
     for (size_t i = 0; i < m_kNodes.size(); ++i)
         PoseNode(i, time);
 }

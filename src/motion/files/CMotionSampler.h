@@ -31,7 +31,7 @@ public:
 private:
     bool FindTracks();
 
-    CNode& m_kRoot;
+    CNode& root_;
     std::vector<CNode*> m_kNodes;
     std::vector<CKeyframeControl*> m_kTracks; // for each node, or null where it does not move
     bool m_bPosesNodes;

@@ -17,25 +17,25 @@ bool CTrackSampler::CanSample(const CControl& control)
 
 Quat CTrackSampler::RotationAt(const KeySpan& span)
 {
-    const std::vector<Quat>& keys = m_kTrack.m_kRotationKeys;
+    const std::vector<Quat>& keys = track_.m_kRotationKeys;
     if (keys.empty())
         return kQuatIdentity;
     if (span.fraction == 0.0f)
         return KeyAt(keys, span.a);
-    if (!m_kArc || m_uiArc != span.a || m_uiArcEnd != span.b)
+    if (!arc_ || m_uiArc != span.a || m_uiArcEnd != span.b)
     {
-        m_kArc.emplace(KeyAt(keys, span.a), KeyAt(keys, span.b));
+        arc_.emplace(KeyAt(keys, span.a), KeyAt(keys, span.b));
         m_uiArc = span.a;
         m_uiArcEnd = span.b;
     }
-    return m_kArc->At(span.fraction);
+    return arc_->At(span.fraction);
 }
 
 bool CTrackSampler::MoveTo(float time)
 {
-    const KeySpan span = FindKeys(m_kTrack.MapTime(time), m_kTrack.m_kKeyTimes, m_uiCursor);
-    const Pose pose{RotationAt(span), LinearKey(m_kTrack.m_kPositionKeys, span, kVec3Zero),
-                    LinearKey(m_kTrack.m_kScaleKeys, span, kVec3One)};
+    const KeySpan span = FindKeys(track_.MapTime(time), track_.m_kKeyTimes, m_uiCursor);
+    const Pose pose{RotationAt(span), LinearKey(track_.m_kPositionKeys, span, kVec3Zero),
+                    LinearKey(track_.m_kScaleKeys, span, kVec3One)};
     if (m_bHasPose && std::memcmp(&pose, &m_kPose, sizeof(Pose)) == 0)
         return false;
     m_kPose = pose;

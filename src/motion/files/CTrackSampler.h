@@ -17,7 +17,7 @@ class CKeyframeControl;
 class CTrackSampler
 {
 public:
-    explicit CTrackSampler(const CKeyframeControl& track) : m_kTrack(track) {}
+    explicit CTrackSampler(const CKeyframeControl& track) : track_(track) {}
 
     /// Whether a control is a plain track that can be read here: no clips, one time axis, active, no parent
     /// mask.
@@ -38,9 +38,9 @@ private:
 
     Quat RotationAt(const KeySpan& span);
 
-    const CKeyframeControl& m_kTrack;
+    const CKeyframeControl& track_;
     KeyCursor m_uiCursor = 0;
-    std::optional<CQuatArc> m_kArc; // between keys m_uiArc and m_uiArcEnd
+    std::optional<CQuatArc> arc_; // between keys m_uiArc and m_uiArcEnd
     uint32_t m_uiArc = 0;
     uint32_t m_uiArcEnd = 0;
     Pose m_kPose;

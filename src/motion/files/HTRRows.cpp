@@ -52,8 +52,8 @@ bool CHTRReader::ReadBasePosition(std::string_view)
 bool CHTRReader::ReadBaseLine(std::string_view line)
 {
     const std::string_view name = NextWord(line);
-    const auto found = m_kFile.segmentOfName.find(name);
-    if (found == m_kFile.segmentOfName.end())
+    const auto found = file_.segmentOfName.find(name);
+    if (found == file_.segmentOfName.end())
     {
         Warn(EFailure::UnknownSegment, name);
         return true;
@@ -74,8 +74,8 @@ bool CHTRReader::ReadBaseLine(std::string_view line)
 bool CHTRReader::ReadSegment(std::string_view section)
 {
     const std::string_view name = NextToken(section, "[]");
-    const auto found = m_kFile.segmentOfName.find(name);
-    if (found == m_kFile.segmentOfName.end())
+    const auto found = file_.segmentOfName.find(name);
+    if (found == file_.segmentOfName.end())
         return Fail(EFailure::UnknownSegment, name);
     TKHTRSegment& segment = *found->second;
     ReserveRows(segment);
@@ -84,7 +84,7 @@ bool CHTRReader::ReadSegment(std::string_view section)
     {
         if (!ReadRow(segment, line, row))
             return false;
-        m_kLines.ForgetRead();
+        lines_.ForgetRead();
     }
     return true;
 }
@@ -93,9 +93,8 @@ bool CHTRReader::ReadSegment(std::string_view section)
 // each exact reservation is a copy.
 void CHTRReader::ReserveRows(TKHTRSegment& segment)
 {
-    const auto frames = static_cast<size_t>(std::max(m_kFile.numFrames, 0));
-    if (!segment.scales.empty() ||
-        frames > m_kLines.ByteCount() / kBytesPerRow / m_kFile.segmentOfName.size())
+    const auto frames = static_cast<size_t>(std::max(file_.numFrames, 0));
+    if (!segment.scales.empty() || frames > lines_.ByteCount() / kBytesPerRow / file_.segmentOfName.size())
         return;
     segment.translations.reserve(frames);
     segment.rotations.reserve(frames);

@@ -28,10 +28,10 @@ constexpr size_t kRowBytesLimit = size_t{1} << 31; // of rows that wait
 constexpr size_t kNoNode = std::numeric_limits<size_t>::max();
 
 // Only the root carries its translation.
-CHTRRow RowOf(const Mat4& local, bool isRoot, const TKHTRSegment& segment)
+HTRRow RowOf(const Mat4& local, bool isRoot, const TKHTRSegment& segment)
 {
     const double length = Vec3Length(local.Row(0));
-    CHTRRow row;
+    HTRRow row;
     if (isRoot)
         row.translation = local.Translation() - segment.baseTranslation;
     row.degrees = RowsToEulerDegrees(local, length) - segment.baseRotation;
@@ -84,7 +84,7 @@ class CRows
 {
 public:
     CRows(const TKHTRFile& file, CNode& motion, std::vector<float> times)
-        : m_kFile(file), m_kTimes(std::move(times)), m_kSampler(motion),
+        : file_(file), m_kTimes(std::move(times)), m_kSampler(motion),
           m_kNodeOfSegment(NodesOfSegments(file, m_kSampler.Nodes()))
     {
     }
@@ -94,13 +94,13 @@ public:
     {
         if (m_kSampler.PosesNodes())
             return true;
-        if (m_kTimes.size() > kRowBytesLimit / sizeof(CHTRRow) / m_kFile.segments.size())
+        if (m_kTimes.size() > kRowBytesLimit / sizeof(HTRRow) / file_.segments.size())
             return false;
-        m_kWaiting.resize(m_kTimes.size() * m_kFile.segments.size());
+        m_kWaiting.resize(m_kTimes.size() * file_.segments.size());
         for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
         {
             m_kSampler.PoseTree(m_kTimes[frame]);
-            for (size_t segment = 0; segment < m_kFile.segments.size(); ++segment)
+            for (size_t segment = 0; segment < file_.segments.size(); ++segment)
                 m_kWaiting[segment * m_kTimes.size() + frame] = PosedRow(segment);
         }
         return true;
@@ -130,13 +130,13 @@ private:
         for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
         {
             if (sampler.MoveTo(m_kTimes[frame]))
-                text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, *m_kFile.segments[segment]));
+                text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, *file_.segments[segment]));
             else
                 text.Repeat(out, NumberOf(frame));
         }
     }
 
-    CHTRRow At(size_t segment, size_t frame)
+    HTRRow At(size_t segment, size_t frame)
     {
         if (!m_kWaiting.empty())
             return m_kWaiting[segment * m_kTimes.size() + frame];
@@ -145,23 +145,23 @@ private:
         return PosedRow(segment);
     }
 
-    CHTRRow PosedRow(size_t segment) const
+    HTRRow PosedRow(size_t segment) const
     {
         const size_t index = m_kNodeOfSegment[segment];
         if (index == kNoNode)
             return {};
         const CNode& node = *m_kSampler.Nodes()[index];
-        return RowOf(node.m_kMatrix, !node.GetParent(), *m_kFile.segments[segment]);
+        return RowOf(node.m_kMatrix, !node.GetParent(), *file_.segments[segment]);
     }
 
-    const TKHTRFile& m_kFile;
+    const TKHTRFile& file_;
     std::vector<float> m_kTimes;
     CMotionSampler m_kSampler;
     std::vector<size_t> m_kNodeOfSegment;
-    std::vector<CHTRRow> m_kWaiting; // segment by segment
+    std::vector<HTRRow> m_kWaiting; // segment by segment
 };
 
-void Write(CLineWriter& out, const TKHTRFile& file, const CHTRText& field)
+void Write(CLineWriter& out, const TKHTRFile& file, const HTRText& field)
 {
     out.Text(file.*field.text);
 }
@@ -189,7 +189,7 @@ void WriteVector(CLineWriter& out, const Vec3& v)
 void WriteHeader(CLineWriter& out, const TKHTRFile& file)
 {
     out.Line("[Header]");
-    for (const CHTRKey& key : kHTRKeys)
+    for (const HTRKey& key : kHTRKeys)
     {
         out.Text(key.name).Text(" ");
         std::visit([&](const auto& field) { Write(out, file, field); }, key.field);

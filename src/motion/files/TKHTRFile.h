@@ -59,35 +59,35 @@ struct TKHTRFile
 
 /// A text field of the header. The format reserves a fixed number of characters for it, one of them for the
 /// terminator; longer values are cut.
-struct CHTRText
+struct HTRText
 {
     std::string TKHTRFile::*text;
     size_t size; ///< with the terminator
 };
 
 /// A key of the header and the field that it fills.
-struct CHTRKey
+struct HTRKey
 {
-    using Field = std::variant<CHTRText, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
+    using Field = std::variant<HTRText, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
 
     std::string_view name;
     Field field;
 };
 
 /// All keys, in the order of writing.
-inline constexpr CHTRKey kHTRKeys[] = {
-    {"FileType",            CHTRText{&TKHTRFile::fileType, 4}        },
-    {"DataType",            CHTRText{&TKHTRFile::dataType, 8}        },
-    {"FileVersion",         &TKHTRFile::fileVersion                  },
-    {"NumSegments",         &TKHTRFile::numSegments                  },
-    {"NumFrames",           &TKHTRFile::numFrames                    },
-    {"DataFrameRate",       &TKHTRFile::dataFrameRate                },
-    {"EulerRotationOrder",  CHTRText{&TKHTRFile::eulerOrder, 4}      },
-    {"CalibrationUnits",    CHTRText{&TKHTRFile::calibrationUnits, 4}},
-    {"RotationUnits",       CHTRText{&TKHTRFile::rotationUnits, 8}   },
-    {"GlobalAxisofGravity", &TKHTRFile::gravityAxis                  },
-    {"BoneLengthAxis",      &TKHTRFile::boneLengthAxis               },
-    {"ScaleFactor",         &TKHTRFile::scaleFactor                  },
+inline constexpr HTRKey kHTRKeys[] = {
+    {"FileType",            HTRText{&TKHTRFile::fileType, 4}        },
+    {"DataType",            HTRText{&TKHTRFile::dataType, 8}        },
+    {"FileVersion",         &TKHTRFile::fileVersion                 },
+    {"NumSegments",         &TKHTRFile::numSegments                 },
+    {"NumFrames",           &TKHTRFile::numFrames                   },
+    {"DataFrameRate",       &TKHTRFile::dataFrameRate               },
+    {"EulerRotationOrder",  HTRText{&TKHTRFile::eulerOrder, 4}      },
+    {"CalibrationUnits",    HTRText{&TKHTRFile::calibrationUnits, 4}},
+    {"RotationUnits",       HTRText{&TKHTRFile::rotationUnits, 8}   },
+    {"GlobalAxisofGravity", &TKHTRFile::gravityAxis                 },
+    {"BoneLengthAxis",      &TKHTRFile::boneLengthAxis              },
+    {"ScaleFactor",         &TKHTRFile::scaleFactor                 },
 };
 
 } // namespace gw

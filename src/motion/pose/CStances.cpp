@@ -28,7 +28,7 @@ const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
 class CPoseKeeper
 {
 public:
-    explicit CPoseKeeper(const std::vector<CNode*>& nodes) : m_kNodes(nodes)
+    explicit CPoseKeeper(const std::vector<CNode*>& nodes) : nodes_(nodes)
     {
         for (const CNode* node : nodes)
             m_kMatrices.emplace_back(node->m_kMatrix, node->m_kWorldMatrix);
@@ -37,12 +37,12 @@ public:
     CPoseKeeper& operator=(const CPoseKeeper&) = delete;
     ~CPoseKeeper()
     {
-        for (size_t i = 0; i < m_kNodes.size(); ++i)
-            std::tie(m_kNodes[i]->m_kMatrix, m_kNodes[i]->m_kWorldMatrix) = m_kMatrices[i];
+        for (size_t i = 0; i < nodes_.size(); ++i)
+            std::tie(nodes_[i]->m_kMatrix, nodes_[i]->m_kWorldMatrix) = m_kMatrices[i];
     }
 
 private:
-    const std::vector<CNode*>& m_kNodes;
+    const std::vector<CNode*>& nodes_;
     std::vector<std::pair<Mat4, Mat4>> m_kMatrices;
 };
 
@@ -55,8 +55,8 @@ CStances::CStances(CNode& root)
         m_kLocalTips.push_back(joint->HasNoNodeChild() ? NodeBoneEnd(*joint) : kVec3Zero);
     const CPoseKeeper keeper(joints);
     const CKeyframeControl* const track = FirstTrack(joints);
-    m_kTree.emplace(joints, track ? track->m_fFrequency : 0.0f);
-    m_kTree->PoseRest();
+    tree_.emplace(joints, track ? track->m_fFrequency : 0.0f);
+    tree_->PoseRest();
     AddPose();
     if (!track)
         return;
@@ -64,7 +64,7 @@ CStances::CStances(CNode& root)
     const size_t count = std::clamp<size_t>(kMostPlaces / joints.size(), 1, std::min(frames, kMostFrames));
     for (size_t i = 0; i < count; ++i)
     {
-        m_kTree->Pose(static_cast<double>(i * frames / count));
+        tree_->Pose(static_cast<double>(i * frames / count));
         AddPose();
     }
 }

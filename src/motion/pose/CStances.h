@@ -21,9 +21,9 @@ public:
     explicit CStances(CNode& root);
 
     /// The joints, depth first.
-    const std::vector<CNode*>& Joints() const { return m_kTree->Joints(); }
+    const std::vector<CNode*>& Joints() const { return tree_->Joints(); }
     /// The index of a joint; -1 for null and for one of another tree.
-    int IndexOf(const CNode* joint) const { return m_kTree->IndexOf(joint); }
+    int IndexOf(const CNode* joint) const { return tree_->IndexOf(joint); }
 
     /// The number of poses. The first one is the rest pose.
     size_t Count() const { return m_kPlaces.size(); }
@@ -43,7 +43,7 @@ private:
 
     void AddPose();
 
-    std::optional<CTreePoser> m_kTree;
+    std::optional<CTreePoser> tree_;
     Places m_kLocalTips; // in the joint's space
     std::vector<Places> m_kPlaces;
     std::vector<Places> m_kTips;

@@ -75,7 +75,7 @@ Mat3 PointedTo(const Vec3& direction, const Mat3& bone, const Vec3& jointBelow)
 } // namespace
 
 CFaithfulPose::CFaithfulPose(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot)
-    : m_kMatcher(matcher), m_kLegs(PlanLegs(retargeter, matcher, targetRoot)),
+    : matcher_(matcher), m_kLegs(PlanLegs(retargeter, matcher, targetRoot)),
       m_kSource(retargeter.SourceOf(targetRoot), SourcesOf(m_kLegs)), m_kSolver(m_kLegs.size())
 {
     for (size_t k = 0; k < m_kLegs.size(); ++k)
@@ -101,10 +101,10 @@ void CFaithfulPose::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>
     {
         for (const size_t index : leg.Path())
         {
-            CPoseMatcher::Bone& bone = m_kMatcher.Bones()[index];
+            CPoseMatcher::Bone& bone = matcher_.Bones()[index];
             bone.rotation = QuatToMat3(tracks[index]->m_kRotationKeys[frame]);
             bone.translation = bone.parent < 0 ? kVec3Zero : tracks[index]->m_kPositionKeys[frame];
-            m_kMatcher.UpdateWorld(index);
+            matcher_.UpdateWorld(index);
         }
     }
 }
@@ -116,16 +116,16 @@ void CFaithfulPose::Plan(const std::vector<CKeyframeControl*>& tracks, const Vec
     {
         PoseFrame(frame, tracks);
         for (CFaithfulLeg& leg : m_kLegs)
-            leg.ReadTarget(m_kMatcher, frame);
+            leg.ReadTarget(matcher_, frame);
     }
-    m_kPlan.emplace(m_kLegs, m_kSource, origin, secondsPerFrame, holdFeet);
+    plan_.emplace(m_kLegs, m_kSource, origin, secondsPerFrame, holdFeet);
 }
 
 void CFaithfulPose::WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
     PoseFrame(frame, tracks);
-    if (IsFinite(m_kPlan->Root(frame)))
-        tracks.front()->m_kPositionKeys.Set(frame, m_kPlan->Root(frame));
+    if (IsFinite(plan_->Root(frame)))
+        tracks.front()->m_kPositionKeys.Set(frame, plan_->Root(frame));
     for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
         WriteLeg(leg, frame, tracks);
 }
@@ -135,7 +135,7 @@ bool CFaithfulPose::SolveKnee(size_t k, size_t frame, const Vec3& ankle, Vec3& k
 {
     const CFaithfulLeg& leg = m_kLegs[k];
     const Vec3 sourceKnee = leg.At(frame).thigh * static_cast<float>(leg.Lengths().upper);
-    const Vec3 forward = Vec3Normalized(leg.Forward(m_kMatcher)) * kForwardHint;
+    const Vec3 forward = Vec3Normalized(leg.Forward(matcher_)) * kForwardHint;
     Vec3 hint = TransformCoord(sourceKnee + forward, AxisSwapForward);
     Mat4 goal = kMat4Identity;
     goal.SetTranslation(TransformCoord(ankle, AxisSwapForward));
@@ -149,9 +149,9 @@ bool CFaithfulPose::SolveKnee(size_t k, size_t frame, const Vec3& ankle, Vec3& k
 void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
     const CFaithfulLeg& leg = m_kLegs[k];
-    const auto& bones = m_kMatcher.Bones();
+    const auto& bones = matcher_.Bones();
     const auto worldOf = [&](size_t bone) { return NormalizedRows(bones[bone].world); };
-    const Vec3 ankle = m_kPlan->Ankle(k, frame);
+    const Vec3 ankle = plan_->Ankle(k, frame);
     Vec3 knee;
     if (!IsFinite(ankle) || !SolveKnee(k, frame, ankle, knee))
         return;

@@ -43,11 +43,11 @@ private:
     bool SolveKnee(size_t leg, size_t frame, const Vec3& ankle, Vec3& knee);
     void WriteLeg(size_t leg, size_t frame, const std::vector<CKeyframeControl*>& tracks);
 
-    CPoseMatcher& m_kMatcher;
+    CPoseMatcher& matcher_;
     std::vector<CFaithfulLeg> m_kLegs;
     CSourceBody m_kSource;
     CLegSolver m_kSolver;
-    std::optional<CStandPlan> m_kPlan;
+    std::optional<CStandPlan> plan_;
 };
 
 } // namespace gw

@@ -30,7 +30,7 @@ size_t Index(int bone)
 } // namespace
 
 CLegPlanter::CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode& targetRoot)
-    : m_kMatcher(matcher), m_iTorso(matcher.IndexOf(FindNode(&targetRoot, kRootBone))),
+    : matcher_(matcher), m_iTorso(matcher.IndexOf(FindNode(&targetRoot, kRootBone))),
       m_pkSourcePelvis(m_iTorso < 0 ? nullptr : retargeter.SourceOf(matcher.Bones()[Index(m_iTorso)].node)),
       m_kSolver(2)
 {
@@ -42,9 +42,9 @@ CLegPlanter::CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, C
 
 bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const HostSide& side)
 {
-    const auto& bones = m_kMatcher.Bones();
-    const int thigh = m_kMatcher.IndexOf(FindNode(&targetRoot, side.thigh));
-    const int foot = m_kMatcher.IndexOf(FindNode(&targetRoot, side.foot));
+    const auto& bones = matcher_.Bones();
+    const int thigh = matcher_.IndexOf(FindNode(&targetRoot, side.thigh));
+    const int foot = matcher_.IndexOf(FindNode(&targetRoot, side.foot));
     const int calf = foot < 0 ? -1 : bones[Index(foot)].parent;
     if (thigh < 0 || calf < 0 || bones[Index(calf)].parent < 0)
         return false;
@@ -85,14 +85,14 @@ void CLegPlanter::Plant(size_t frame, float scale, const std::vector<CKeyframeCo
 void CLegPlanter::UpdatePath(const LegRecord& leg)
 {
     for (const size_t bone : leg.path)
-        m_kMatcher.UpdateWorld(bone);
+        matcher_.UpdateWorld(bone);
 }
 
 // The length of a bone's translation under its parent's scale along the bone.
 double CLegPlanter::SegmentLength(size_t index) const
 {
-    const CPoseMatcher::Bone& bone = m_kMatcher.Bones()[index];
-    const Mat4& parentWorld = m_kMatcher.Bones()[Index(bone.parent)].world;
+    const CPoseMatcher::Bone& bone = matcher_.Bones()[index];
+    const Mat4& parentWorld = matcher_.Bones()[Index(bone.parent)].world;
     return Vec3Length(bone.translation) * Vec3Length(parentWorld.Row(1));
 }
 
@@ -110,7 +110,7 @@ Vec3 CLegPlanter::HintPoint(const LegRecord& leg) const
 // The ankle's goal, and the point toward which the knee bends, as seen from the hip in the solver's frame.
 void CLegPlanter::LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const
 {
-    const auto& bones = m_kMatcher.Bones();
+    const auto& bones = matcher_.Bones();
     const Vec3 sourcePelvis = m_pkSourcePelvis->m_kWorldMatrix.Translation();
     const Vec3 fromHip = bones[Index(m_iTorso)].world.Translation() - bones[leg.thigh].world.Translation();
     const auto toLimb = [&](const Vec3& point) {
@@ -124,7 +124,7 @@ void CLegPlanter::PlantLeg(size_t k, size_t frame, float scale, const std::vecto
 {
     const LegRecord& leg = m_kLegs[k];
     UpdatePath(leg);
-    const auto& bones = m_kMatcher.Bones();
+    const auto& bones = matcher_.Bones();
     const CPoseMatcher::Bone& thigh = bones[leg.thigh];
     m_kSolver.SetLimb(k, {0.0f, static_cast<float>(SegmentLength(leg.calf)), 0.0f},
                       {0.0f, static_cast<float>(SegmentLength(leg.foot)), 0.0f}, kVec3UnitZ, kVec3UnitX);

@@ -47,7 +47,7 @@ private:
     void PlantLeg(size_t k, size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks);
     double SegmentLength(size_t bone) const;
 
-    CPoseMatcher& m_kMatcher;
+    CPoseMatcher& matcher_;
     std::vector<LegRecord> m_kLegs;
     int m_iTorso;
     const CNode* m_pkSourcePelvis;

@@ -92,7 +92,7 @@ struct Weights
 
 Weights WeightsOf(const CRetargeter& retargeter, const CNode& node)
 {
-    const CBoneShares* shares = nullptr;
+    const BoneShares* shares = nullptr;
     if (retargeter.Shares(&node, shares))
         return {shares->m_fShare1, shares->m_fShare2,
                 static_cast<int>(std::clamp(shares->m_fType, -1.0f, 1e6f))};

@@ -20,7 +20,7 @@ constexpr std::string_view kShareDelimiters = " ,:\n";
 class CShareLine
 {
 public:
-    explicit CShareLine(CBoneShares& shares) : m_kShares(shares) {}
+    explicit CShareLine(BoneShares& shares) : shares_(shares) {}
 
     void Read(std::string_view line)
     {
@@ -46,8 +46,8 @@ private:
     }
     void TakeNumber(float value)
     {
-        float* const places[] = {&m_kShares.m_fShare1, &m_kShares.m_fShare2};
-        float* place = m_bType ? (m_iIndex == 0 ? &m_kShares.m_fType : nullptr)
+        float* const places[] = {&shares_.m_fShare1, &shares_.m_fShare2};
+        float* place = m_bType ? (m_iIndex == 0 ? &shares_.m_fType : nullptr)
                                : (m_iIndex < 2 ? places[m_iIndex] : nullptr);
         ++m_iIndex;
         if (!place)
@@ -56,7 +56,7 @@ private:
         ++m_iCount;
     }
 
-    CBoneShares& m_kShares;
+    BoneShares& shares_;
     std::string m_kName;
     bool m_bType = false;
     int m_iIndex = 0;
@@ -114,7 +114,7 @@ bool CRetargeter::LoadShares(const std::string& path)
         return false;
     std::string_view rest = SkipByteOrderMark(file.Text());
     const std::vector<CNode*> nodes = m_pkTargetRoot ? NodesOf(*m_pkTargetRoot) : std::vector<CNode*>();
-    CBoneShares shares;
+    BoneShares shares;
     for (std::string_view line; NextLine(rest, line);)
     {
         do
@@ -154,7 +154,7 @@ bool CRetargeter::SetFixed(CNode* target, bool fixed)
     return true;
 }
 
-bool CRetargeter::SetShares(CNode* target, const CBoneShares& shares)
+bool CRetargeter::SetShares(CNode* target, const BoneShares& shares)
 {
     m_kBoneShares[target] = shares;
     return true;
@@ -185,7 +185,7 @@ bool CRetargeter::IsFixed(const CNode* node, bool& fixed) const
     return entry != nullptr;
 }
 
-bool CRetargeter::Shares(const CNode* node, const CBoneShares*& shares) const
+bool CRetargeter::Shares(const CNode* node, const BoneShares*& shares) const
 {
     shares = Find(m_kBoneShares, node);
     return shares != nullptr;

@@ -18,7 +18,7 @@ class CKeyframeControl;
 class CPoseMatcher;
 
 /// Per-bone tuning of the target skeleton, from the share file.
-struct CBoneShares
+struct BoneShares
 {
     float m_fShare1 = 0.0f; ///< weight in the blend between the two decompositions
     float m_fShare2 = 0.0f; ///< weight in the sine curve of the first rotation
@@ -50,7 +50,7 @@ public:
     bool SetOffsetAngles(CNode* target, const Vec3& degrees);
     bool SetOffsetMatrix(CNode* target, const Mat3& matrix);
     bool SetFixed(CNode* target, bool fixed);
-    bool SetShares(CNode* target, const CBoneShares& shares);
+    bool SetShares(CNode* target, const BoneShares& shares);
 
     /// Whether a bone that takes the whole of a rotation takes it as it is, also at whole quarter turns,
     /// where the decomposition of its share gives another one back. Off by the rules; the tables do not
@@ -63,7 +63,7 @@ public:
     const Vec3& OffsetAngles(const CNode* node) const;
     const Mat3& OffsetMatrix(const CNode* node) const;
     bool IsFixed(const CNode* node, bool& fixed) const;
-    bool Shares(const CNode* node, const CBoneShares*& shares) const;
+    bool Shares(const CNode* node, const BoneShares*& shares) const;
 
     /// The source's size as a factor for the target, and how far the feet rise over the ground: leg plus
     /// pelvis heights compared, bent by `weight`. Both trees stand in rest pose. Outputs are left alone where
@@ -83,7 +83,7 @@ public:
     void SetFaithful(bool faithful) { m_bFaithful = faithful; }
 
     /// What a run calls now and then, with the frames done and their number.
-    void SetProgress(std::function<void(size_t, size_t)> progress) { m_kProgress = std::move(progress); }
+    void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
 
     /// What the last run was not happy with.
     const CFailureRecord& Record() const { return m_kRecord; }
@@ -105,7 +105,7 @@ private:
                      CFaithfulPose* keeper);
     void ShowProgress(size_t done, size_t total) const;
 
-    std::map<const CNode*, CBoneShares> m_kBoneShares;
+    std::map<const CNode*, BoneShares> m_kBoneShares;
     std::map<const CNode*, CNode*> m_kSourceOf;
     std::map<const CNode*, Vec3> m_kOffsetAngles;
     std::map<const CNode*, bool> m_kFixedBones;
@@ -115,7 +115,7 @@ private:
     bool m_bFaithful = false;
     bool m_bPlainTurns = false;
     CFailureRecord m_kRecord;
-    std::function<void(size_t, size_t)> m_kProgress;
+    std::function<void(size_t, size_t)> progress_;
 };
 
 } // namespace gw

@@ -60,7 +60,7 @@ double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 
 CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, const Vec3& origin,
                        double secondsPerFrame, bool holdFeet)
-    : m_kLegs(legs), m_kSource(source), m_fScale(ScaleOf(legs, source.LegLength())),
+    : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())),
       m_kRoots(source.FrameCount(), kVec3Zero)
 {
     const ContactsOfLegs contacts = source.Contacts(secondsPerFrame);
@@ -68,7 +68,7 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
     StandOnFloor(contacts);
     if (!holdFeet)
         return;
-    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    for (size_t leg = 0; leg < legs_.size(); ++leg)
         m_kHolds.push_back(HoldFoot({FreePath(leg), SourcePath(leg), m_fScale}, contacts[leg], kDriftPlay,
                                     kFadeSeconds / secondsPerFrame));
     std::vector<float> lifts(m_kRoots.size(), 0.0f);
@@ -80,9 +80,9 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
 Vec3 CStandPlan::Sway(size_t frame) const
 {
     Vec3 hips = kVec3Zero;
-    for (const CFaithfulLeg& leg : m_kLegs)
-        hips = hips + leg.At(frame).hip * (1.0f / static_cast<float>(m_kLegs.size()));
-    return (m_kSource.Hips(frame) - m_kSource.Root(frame)) * static_cast<float>(m_fScale) - hips;
+    for (const CFaithfulLeg& leg : legs_)
+        hips = hips + leg.At(frame).hip * (1.0f / static_cast<float>(legs_.size()));
+    return (source_.Hips(frame) - source_.Root(frame)) * static_cast<float>(m_fScale) - hips;
 }
 
 // How far the root is led over the ground by hips that sway below it. The target's root lies higher over its
@@ -123,7 +123,7 @@ void CStandPlan::PlaceRoot(const Vec3& origin, double secondsPerFrame)
     m_kRoots = SwayLead(kSwaySeconds / secondsPerFrame);
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
     {
-        Vec3 way = (m_kSource.Root(frame) - m_kSource.Root(0)) * static_cast<float>(m_fScale);
+        Vec3 way = (source_.Root(frame) - source_.Root(0)) * static_cast<float>(m_fScale);
         way.y += Sway(frame).y;
         m_kRoots[frame] = m_kRoots[frame] + way;
     }
@@ -135,8 +135,8 @@ void CStandPlan::PlaceRoot(const Vec3& origin, double secondsPerFrame)
 // How much higher the root must be for the sole of a leg in its base pose to lie on the floor.
 float CStandPlan::Lift(size_t leg, size_t frame) const
 {
-    const CFaithfulLeg::Frame& at = m_kLegs[leg].At(frame);
-    return at.sole - (m_kRoots[frame] + at.hip + m_kLegs[leg].Stretch(frame)).y;
+    const CFaithfulLeg::Frame& at = legs_[leg].At(frame);
+    return at.sole - (m_kRoots[frame] + at.hip + legs_[leg].Stretch(frame)).y;
 }
 
 // Raises the whole motion so that it stands on the floor: by the median of the contacts, and where there are
@@ -145,7 +145,7 @@ void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts)
 {
     std::vector<float> standing;
     std::vector<float> all;
-    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
         for (const Contact& contact : contacts[leg])
         {
@@ -168,15 +168,15 @@ std::vector<Vec3> CStandPlan::FreePath(size_t leg) const
     path.reserve(m_kRoots.size());
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
     {
-        const CFaithfulLeg::Frame& at = m_kLegs[leg].At(frame);
-        path.push_back(m_kRoots[frame] + at.hip + m_kLegs[leg].Stretch(frame) + at.toe * kHeldShare);
+        const CFaithfulLeg::Frame& at = legs_[leg].At(frame);
+        path.push_back(m_kRoots[frame] + at.hip + legs_[leg].Stretch(frame) + at.toe * kHeldShare);
     }
     return path;
 }
 
 std::vector<Vec3> CStandPlan::SourcePath(size_t leg) const
 {
-    const CLegTrack& track = m_kSource.Leg(leg);
+    const CLegTrack& track = source_.Leg(leg);
     std::vector<Vec3> path = track.Ankles();
     for (size_t frame = 0; frame < track.Toes().size(); ++frame)
         path[frame] = path[frame] + (track.Toes()[frame] - path[frame]) * kHeldShare;
@@ -186,10 +186,10 @@ std::vector<Vec3> CStandPlan::SourcePath(size_t leg) const
 // Where the ankle is to be, from the hip, whether the leg reaches it or not.
 Vec3 CStandPlan::AskedAnkle(size_t leg, size_t frame) const
 {
-    const CFaithfulLeg::Frame& at = m_kLegs[leg].At(frame);
+    const CFaithfulLeg::Frame& at = legs_[leg].At(frame);
     const FootHold& hold = m_kHolds[leg][frame];
     const Vec3 hip = m_kRoots[frame] + at.hip;
-    const Vec3 stretch = m_kLegs[leg].Stretch(frame);
+    const Vec3 stretch = legs_[leg].Stretch(frame);
     Vec3 ankle = stretch + (hold.place - hip - stretch - at.toe * kHeldShare) * hold.share;
     const double sole = AboveFloor(static_cast<double>(hip.y + stretch.y - at.sole));
     ankle.y = static_cast<float>((1.0 - static_cast<double>(hold.share)) * sole) + at.sole - hip.y;
@@ -199,11 +199,11 @@ Vec3 CStandPlan::AskedAnkle(size_t leg, size_t frame) const
 Vec3 CStandPlan::Ankle(size_t leg, size_t frame) const
 {
     if (m_kHolds.empty())
-        return m_kLegs[leg].Stretch(frame);
+        return legs_[leg].Stretch(frame);
     const Vec3 asked = AskedAnkle(leg, frame);
     const double distance = Vec3Length(asked);
     const double reach =
-        YieldingReach(m_kLegs[leg].Lengths(), distance, m_kLegs[leg].KneeAngle(frame), kStiffness);
+        YieldingReach(legs_[leg].Lengths(), distance, legs_[leg].KneeAngle(frame), kStiffness);
     return asked * static_cast<float>(reach / distance);
 }
 
@@ -214,7 +214,7 @@ void CStandPlan::AddPull(size_t leg, size_t frame, Pull& pull) const
     const Vec3 asked = AskedAnkle(leg, frame);
     const double distance = Vec3Length(asked);
     const double reach = Vec3Length(Ankle(leg, frame));
-    const LegLengths& lengths = m_kLegs[leg].Lengths();
+    const LegLengths& lengths = legs_[leg].Lengths();
     const double slope = ReachSlope(lengths, AngleAt(lengths, reach)) / kStiffness;
     const double upright = static_cast<double>(-asked.y) / distance;
     const auto share = static_cast<double>(m_kHolds[leg][frame].share);
@@ -229,7 +229,7 @@ void CStandPlan::AddPull(size_t leg, size_t frame, Pull& pull) const
 void CStandPlan::LiftRoot(double smoothFrames, std::vector<float>& lifts)
 {
     Pull pull{std::vector<float>(m_kRoots.size(), 0.0f), std::vector<float>(m_kRoots.size(), 0.0f)};
-    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
         for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
             AddPull(leg, frame, pull);

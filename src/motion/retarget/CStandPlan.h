@@ -44,8 +44,8 @@ private:
     void AddPull(size_t leg, size_t frame, Pull& pull) const;
     void LiftRoot(double smoothFrames, std::vector<float>& lifts);
 
-    const std::vector<CFaithfulLeg>& m_kLegs;
-    const CSourceBody& m_kSource;
+    const std::vector<CFaithfulLeg>& legs_;
+    const CSourceBody& source_;
     double m_fScale; // of the source's lengths
     std::vector<Vec3> m_kRoots;
     std::vector<std::vector<FootHold>> m_kHolds; // by leg and frame; empty where feet are not held

@@ -275,8 +275,8 @@ void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframe
 
 void CRetargeter::ShowProgress(size_t done, size_t total) const
 {
-    if (m_kProgress && done % kProgressFrames == 0)
-        m_kProgress(done, total);
+    if (progress_ && done % kProgressFrames == 0)
+        progress_(done, total);
 }
 
 } // namespace gw

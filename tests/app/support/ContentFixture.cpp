@@ -15,7 +15,7 @@ EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButton
 {
     m_kCalls.push_back("box " + std::to_string(id));
     m_kBoxes.push_back(text);
-    m_kOnBox();
+    onBox();
     const auto answer = m_kAnswers.find(id);
     return answer == m_kAnswers.end() ? EAnswer::OK : answer->second;
 }
@@ -47,22 +47,22 @@ std::string CScriptedWindow::TakeWords()
     return words;
 }
 
-std::optional<std::string> CScriptedWindow::AskOpenFile(const CFileDialogSetup& setup)
+std::optional<std::string> CScriptedWindow::AskOpenFile(const FileDialogSetup& setup)
 {
     m_kCalls.push_back("open *." + setup.defaultExtension + " in " + setup.initialFolder);
-    return m_kOpenAnswer;
+    return openAnswer;
 }
 
-std::optional<std::string> CScriptedWindow::AskSaveFile(const CFileDialogSetup& setup)
+std::optional<std::string> CScriptedWindow::AskSaveFile(const FileDialogSetup& setup)
 {
     m_kCalls.push_back("save *." + setup.defaultExtension);
-    return m_kSaveAnswer;
+    return saveAnswer;
 }
 
-std::optional<CFolderChoice> CScriptedWindow::AskFolder(const CFileDialogSetup& setup)
+std::optional<FolderChoice> CScriptedWindow::AskFolder(const FileDialogSetup& setup)
 {
     m_kCalls.push_back("folder in " + setup.initialFolder);
-    return m_kFolderAnswer;
+    return folderAnswer;
 }
 
 std::unique_ptr<CMotionView> CScriptedWindow::CreateView(std::string_view child)
@@ -267,7 +267,7 @@ std::string ContentTest::WriteContainer(const std::string& name, bool withTrack)
 
 int ContentTest::Open(const std::string& path)
 {
-    m_kWindow.m_kOpenAnswer = path;
+    m_kWindow.openAnswer = path;
     return m_kContent.OpenSource();
 }
 
@@ -296,7 +296,7 @@ void ContentTest::OpenAndConvert()
 
 int ContentTest::SaveAs(const std::string& name)
 {
-    m_kWindow.m_kSaveAnswer = m_kFolder.Path(name);
+    m_kWindow.saveAnswer = m_kFolder.Path(name);
     return m_kContent.SaveResult();
 }
 

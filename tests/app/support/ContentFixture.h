@@ -34,12 +34,12 @@ class CScriptedWindow : public CContentWindow
 {
 public:
     EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
-    std::optional<std::string> AskOpenFile(const CFileDialogSetup& setup) override;
-    std::optional<std::string> AskSaveFile(const CFileDialogSetup& setup) override;
-    std::optional<CFolderChoice> AskFolder(const CFileDialogSetup& setup) override;
+    std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) override;
+    std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override;
+    std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
     void Report(const CReport& report) override;
-    void StayPainted() override { m_kOnPaint(); }
+    void StayPainted() override { onPaint(); }
     bool IsProgressDue() override { return m_bProgressDue; }
     void BeginWaitCursor() override { ++m_iWaits; }
     void EndWaitCursor() override { --m_iWaits; }
@@ -60,9 +60,9 @@ public:
     void ShowInFileManager(const std::string& path) override { m_kCalls.push_back("show " + path); }
     void OpenHelpFile(const std::string& path) override { m_kCalls.push_back("help " + path); }
     bool OpenWebPage(const std::string& address) override;
-    void ShowProfileEditor(bool shown) override { m_kOnShowEditor(shown); }
-    void RefreshProfileEditor() override { m_kOnRefreshEditor(); }
-    bool RunBoneOffset(CBoneOffsetDialog& dialog) override { return m_kOnBoneOffset(dialog); }
+    void ShowProfileEditor(bool shown) override { onShowEditor(shown); }
+    void RefreshProfileEditor() override { onRefreshEditor(); }
+    bool RunBoneOffset(CBoneOffsetDialog& dialog) override { return onBoneOffset(dialog); }
 
     /// The enabled children, with blanks between them, in no order that matters.
     std::set<std::string> Enabled() const;
@@ -71,16 +71,16 @@ public:
     /// Of these the reports and message boxes: "not-found, 138".
     std::string TakeWords();
 
-    std::optional<std::string> m_kOpenAnswer;
-    std::optional<std::string> m_kSaveAnswer;
-    std::optional<CFolderChoice> m_kFolderAnswer;
+    std::optional<std::string> openAnswer;
+    std::optional<std::string> saveAnswer;
+    std::optional<FolderChoice> folderAnswer;
     std::map<int, EAnswer> m_kAnswers; ///< by message; all others are answered with OK
     std::set<EKey> m_kKeys;
-    std::function<void()> m_kOnPaint = [] {}; ///< what happens in the midst of an operation
-    std::function<void()> m_kOnBox = [] {};   ///< what else happens while a message box is open
-    std::function<void(bool shown)> m_kOnShowEditor = [](bool) {};
-    std::function<void()> m_kOnRefreshEditor = [] {};
-    std::function<bool(CBoneOffsetDialog& dialog)> m_kOnBoneOffset = [](CBoneOffsetDialog&) { return false; };
+    std::function<void()> onPaint = [] {}; ///< what happens in the midst of an operation
+    std::function<void()> onBox = [] {};   ///< what else happens while a message box is open
+    std::function<void(bool shown)> onShowEditor = [](bool) {};
+    std::function<void()> onRefreshEditor = [] {};
+    std::function<bool(CBoneOffsetDialog& dialog)> onBoneOffset = [](CBoneOffsetDialog&) { return false; };
     CProfileList m_kList;
     std::map<std::string, bool> m_kEnabled;
     std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"

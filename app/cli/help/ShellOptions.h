@@ -17,7 +17,7 @@ enum class EExit : int
 };
 
 /// Of a picture, as the command line says it; not yet looked at by whoever draws.
-struct CPixelSize
+struct PixelSize
 {
     int width = 640;
     int height = 480;
@@ -25,7 +25,7 @@ struct CPixelSize
 
 /// What a command line asks for. One record serves all commands; each reads what its row in the table of
 /// commands lets through.
-struct COptions
+struct ShellOptions
 {
     std::vector<std::string> files; ///< operands, in the order of the command line
 
@@ -46,7 +46,7 @@ struct COptions
     std::optional<float> time; ///< --time, in place of a frame; in the unit of the file's controls
     std::string with;          ///< the motion to draw beside the first one; empty for none
     int64_t strip = 1;         ///< number of poses
-    CPixelSize size;
+    PixelSize size;
     float rate = 0.0f;       ///< frames per second
     float frameScale = 1.0f; ///< factor for the number of frames
 
