@@ -4,7 +4,8 @@
 
 namespace gw {
 
-// One translation unit, so that these are filled in order: pi first, the others from pi.
+// In one translation unit, so that they are initialized in order: pi first, then the constants derived from
+// it.
 const double kPi64 = 4.0 * std::atan2(1.0, 1.0);
 const double kTwoPi64 = kPi64 * 2.0;
 const double kHalfPi64 = kPi64 * 0.5;
@@ -18,8 +19,8 @@ const float kTwoPi = kPi * 2.0f;
 const float kHalfPi = kPi * 0.5f;
 const float kInversePi = 1.0f / kPi;
 const float kInverseTwoPi = 1.0f / kTwoPi;
-// Rounded once: from a rounded pi, the product would be one unit in the last place too large, and angles in
-// files would drift with every load and save.
+// Rounded once. A product with an already rounded pi would be one unit in the last place too large, and
+// angles in files would drift with every load and save.
 const float kDegreesToRadians = static_cast<float>(kDegreesToRadians64);
 const float kRadiansToDegrees = 180.0f / kPi;
 

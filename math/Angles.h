@@ -8,7 +8,7 @@ extern const float kTwoPi;
 extern const float kHalfPi;
 extern const float kInversePi;
 extern const float kInverseTwoPi;
-extern const float kDegreesToRadians; ///< what turns the degrees of files into radians, everywhere
+extern const float kDegreesToRadians; ///< converts the degrees of files to radians everywhere
 extern const float kRadiansToDegrees;
 
 extern const double kPi64;
@@ -22,11 +22,11 @@ extern const double kRadiansToDegrees64;
 /// The common tolerance, 2 to the power -23.
 inline constexpr float kEpsilon = 1.1920929e-07f;
 
-/// The arc cosine in radians; pi at or below -1, 0 at or above 1.
+/// Returns the arc cosine in radians: pi at or below -1, 0 at or above 1.
 double SafeAcos(float x);
 
-/// The arc sine in radians, with its ends the other way round on purpose: +pi / 2 at or below -1 and -pi / 2
-/// at or above 1. Euler decompositions of whole quarter turns rest on it.
+/// Returns the arc sine in radians. The ends are swapped on purpose: +pi / 2 at or below -1 and -pi / 2 at or
+/// above 1. Euler decompositions of exact quarter turns depend on it.
 double SafeAsin(float x);
 
 } // namespace gw

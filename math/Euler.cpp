@@ -1,3 +1,14 @@
+// Conversion between rotation matrices and Euler angles.
+//
+// Every order comes down to the same three steps: one matrix element is the sine of the middle angle, and the
+// two outer angles are the arc tangents of two pairs of elements. When the middle angle is a quarter turn
+// (gimbal lock), the outer two turn about the same axis and only their sum or difference is defined, so one
+// is set to 0 and the other takes the whole rotation.
+//
+// The orders do not agree on details: which angle becomes 0, when the lock is detected, where a sign falls
+// for an element of exactly 0, and SafeAsin swaps its ends. Files depend on these differences byte for byte,
+// so the code keeps one function or table row per variant instead of one formula for all.
+
 #include "Euler.h"
 
 #include "Angles.h"
@@ -24,8 +35,9 @@ constexpr OrderRow kOrders[] = {
     {"YXZ", {2, 0, 1}},
 };
 
-// Codes 0 to 3 share one scheme, written as a table of matrix elements with signs. The middle angle is an arc
-// sine; `gimbal` is the angle that takes over when it stands at a quarter turn, and the third one is then 0.
+// Orders 0 to 3 share one scheme, written as a table of matrix elements with signs. The middle angle is an
+// arc sine. When it is a quarter turn, `gimbal` is the angle of the gimbal axis, and the angle of the zero
+// axis is 0.
 struct Element
 {
     int index;
@@ -76,7 +88,7 @@ bool IsNearHalfPi(double angle)
     return std::fabs(std::fabs(angle) - kHalfPi64) < static_cast<double>(kEpsilon);
 }
 
-// "ZXY": element 5 carries the sine of X, and X is taken last from a derived cosine.
+// "ZXY": element 5 is the sine of X. X is computed last, from a derived cosine.
 void DecomposeZXY(const float* m, float* angles)
 {
     if (1.0f - std::fabs(m[5]) < kEpsilon)
@@ -93,8 +105,8 @@ void DecomposeZXY(const float* m, float* angles)
     angles[2] = static_cast<float>(z);
 }
 
-// "YXZ": element 7 carries the negative sine of X. An element of exactly 0 falls on the other side than
-// above.
+// "YXZ": element 7 is the negative sine of X. For an element of exactly 0, the sign falls on the other side
+// than in DecomposeZXY.
 void DecomposeYXZ(const float* m, float* angles)
 {
     if (1.0f - std::fabs(m[7]) < kEpsilon)
@@ -118,13 +130,14 @@ double QuotientAngle(float numerator, float denominator)
     return std::atan(static_cast<double>(numerator) / denominator);
 }
 
-// An arc sine has no negative cosine, so its cosine cannot change a sign; it is not computed. A NaN has none.
+// An arc sine lies within a quarter turn, so its cosine is never negative and cannot flip a sign; only the
+// other factor matters. For a NaN, nothing is flipped.
 double InHalfTurn(double angle, float denominator, double y)
 {
     return denominator < 0.0f && !std::isnan(y) ? angle + kPi64 : angle;
 }
 
-// The five elements that the "ZYX" decomposition looks at: the first row, and the ends of the others.
+// Decomposes "ZYX" from the only five elements it needs: row 0 and the last elements of rows 1 and 2.
 Vec3 EulerDegreesOf(const Vec3& row0, float m5, float m8)
 {
     const double y = SafeAsin(-row0.z);
@@ -191,7 +204,7 @@ Vec3 EulerDegreesZYX(const Mat3& m)
     const float* e = m.m;
     const double z = std::atan2(static_cast<double>(e[1]), static_cast<double>(e[0]));
     const double y = std::atan2(-static_cast<double>(e[2]), std::hypot(e[0], e[1]));
-    // What is left when z is taken off again turns about X alone in these two rows.
+    // After rotating back by z, these two rows contain a rotation about X only.
     const double c = std::cos(z);
     const double s = std::sin(z);
     const double x = std::atan2(e[6] * s - e[7] * c, e[4] * c - e[3] * s);

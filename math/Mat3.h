@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// A rotation or row basis: nine floats, row-major, element m[3r + c]. Rows multiply from the left; in A · B
-/// the transform A acts first. A positive angle about kVec3UnitZ takes (1, 0, 0) to (cos a, sin a, 0).
+/// A rotation or row basis: nine floats, row-major, element m[3r + c]. Row vectors multiply from the left, so
+/// A · B applies A first. A positive angle about kVec3UnitZ rotates (1, 0, 0) to (cos a, sin a, 0).
 struct Mat3
 {
     float m[9];
@@ -32,7 +32,7 @@ inline constexpr Mat3 kMat3Identity{
     {1, 0, 0, 0, 1, 0, 0, 0, 1}
 };
 
-/// The product: a acts first.
+/// Returns the product; a acts first.
 inline Mat3 operator*(const Mat3& a, const Mat3& b)
 {
     Mat3 out;
@@ -45,7 +45,7 @@ inline Mat3 operator*(const Mat3& a, const Mat3& b)
     return out;
 }
 
-/// The transpose, which is the inverse of a rotation.
+/// Returns the transpose, which is the inverse of a rotation.
 inline Mat3 Mat3Transpose(const Mat3& a)
 {
     return {
@@ -55,10 +55,10 @@ inline Mat3 Mat3Transpose(const Mat3& a)
 
 /// out := a · b; out may be a or b. Returns out.
 Mat3& Mat3Multiply(const Mat3& a, const Mat3& b, Mat3& out);
-/// The rotation about an axis of unit length (not normalised here) by an angle in radians, into out.
+/// Writes the rotation about an axis of unit length (not normalized here) by an angle in radians to out.
 void Mat3FromAxisAngle(Mat3& out, const Vec3& axis, float angle);
 Mat3 Mat3FromAxisAngle(const Vec3& axis, float angle);
-/// The general inverse; the identity where there is none.
+/// Returns the inverse, or the identity if m is singular.
 Mat3 Mat3InverseOrIdentity(const Mat3& a);
 
 } // namespace gw

@@ -26,7 +26,7 @@ Mat4* Mat4Inverse(Mat4* out, float* determinant, const Mat4* m)
     for (int i = 0; i < 16; ++i)
         e[i] = static_cast<double>(m->m[i]);
 
-    // 2 by 2 minors of the upper two and of the lower two rows; Laplace expansion along them.
+    // 2x2 minors of the upper two and the lower two rows, for a Laplace expansion along them.
     const double s0 = e[0] * e[5] - e[4] * e[1];
     const double s1 = e[0] * e[6] - e[4] * e[2];
     const double s2 = e[0] * e[7] - e[4] * e[3];

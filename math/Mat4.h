@@ -10,7 +10,7 @@ struct Mat4
 {
     float m[16];
 
-    /// The first three elements of a row; row 3 is the translation.
+    /// Returns the first three elements of a row; row 3 is the translation.
     Vec3 Row(int row) const
     {
         const float* r = m + 4 * static_cast<ptrdiff_t>(row);
@@ -33,7 +33,7 @@ inline constexpr Mat4 kMat4Identity{
 
 inline constexpr Mat4 kMat4Zero{};
 
-/// From the bones' frame to the limb solver's, and back: permutations with sign, inverse to each other.
+/// From the bones' frame to the limb solver's frame and back: signed permutations, inverse to each other.
 inline constexpr Mat4 AxisSwapForward{
     {0, -1, 0, 0, 0, 0, -1, 0, 1, 0, 0, 0, 0, 0, 0, 1}
 };
@@ -42,7 +42,7 @@ inline constexpr Mat4 AxisSwapBack{
     {0, 0, 1, 0, -1, 0, 0, 0, 0, -1, 0, 0, 0, 0, 0, 1}
 };
 
-/// out := S · R · T. A null input stands for kMat3Identity, kVec3Zero, kVec3One.
+/// out := S · R · T. A null input means kMat3Identity, kVec3Zero or kVec3One.
 void Mat4Compose(Mat4& out, const Mat3* rotation, const Vec3* translation, const Vec3* scale);
 
 inline Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec3& scale = kVec3One)
@@ -55,7 +55,7 @@ inline Mat4 Mat4Compose(const Mat3& rotation, const Vec3& translation, const Vec
     };
 }
 
-/// out := a · b; out may be a or b. With a null pointer nothing is written and null answered.
+/// out := a · b; out may be a or b. If any pointer is null, nothing is written and null is returned.
 Mat4* Mat4Multiply(Mat4* out, const Mat4* a, const Mat4* b);
 
 inline Mat4 operator*(const Mat4& a, const Mat4& b)
@@ -71,13 +71,14 @@ inline Mat4 operator*(const Mat4& a, const Mat4& b)
     return out;
 }
 
-/// The general inverse of m into out. Null, and out left alone, where the determinant is 0 or its reciprocal
-/// is not finite in 32 bits. A non-null determinant is written before any test.
+/// Writes the inverse of m to out. Returns null and leaves out unchanged if the determinant is 0 or its
+/// reciprocal is not finite in 32 bits. `determinant`, if not null, is written in either case.
 Mat4* Mat4Inverse(Mat4* out, float* determinant, const Mat4* m);
-/// The same with a result in every case: the identity where there is no inverse.
+/// Returns the inverse, or the identity if m is singular.
 Mat4 Mat4InverseOrIdentity(const Mat4& m);
 
-/// (v, 1) · m, divided by its fourth element unless that is 1 within kEpsilon. Null for an absent pointer.
+/// Writes (v, 1) · m to out, divided by its fourth element unless that is 1 within kEpsilon. Returns null if
+/// a pointer is null.
 Vec3* TransformCoord(Vec3* out, const Vec3* v, const Mat4* m);
 
 inline Vec3 TransformCoord(const Vec3& v, const Mat4& matrix)
@@ -91,14 +92,15 @@ inline Vec3 TransformCoord(const Vec3& v, const Mat4& matrix)
     return p * (1.0f / w);
 }
 
-/// Lengths of the first three rows: the scale of a transform.
+/// Returns the lengths of the first three rows: the scale of a transform.
 inline Vec3 RowLengths(const Mat4& m)
 {
     return {static_cast<float>(Vec3Length(m.Row(0))), static_cast<float>(Vec3Length(m.Row(1))),
             static_cast<float>(Vec3Length(m.Row(2)))};
 }
 
-/// The first three rows divided by their lengths: the rotation of a transform. A row of length 0 is kept.
+/// Returns the first three rows divided by their lengths: the rotation of a transform. A row of length 0
+/// stays as it is.
 inline Mat3 NormalizedRows(const Mat4& m)
 {
     Mat3 out;

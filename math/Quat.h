@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// A rotation: four floats in the order w, x, y, z, in memory, in files and in every argument.
+/// A rotation: four floats in the order w, x, y, z, in memory, in files and in all arguments.
 struct Quat
 {
     float w;
@@ -24,9 +24,9 @@ inline constexpr Quat kQuatIdentity{1.0f, 0.0f, 0.0f, 0.0f};
 
 inline constexpr Quat kQuatZero{0.0f, 0.0f, 0.0f, 0.0f};
 
-/// All four components times s, with no renormalisation.
+/// Multiplies all four components by s; the result is not normalized.
 void QuatScale(const Quat& q, float s, Quat& out);
-/// The matrix of a unit quaternion; the norm is not divided out.
+/// Writes the matrix of a unit quaternion; q is not normalized first.
 void QuatToMat3(const Quat& q, Mat3& out);
 
 inline Mat3 QuatToMat3(const Quat& q)
@@ -46,10 +46,9 @@ inline Mat3 QuatToMat3(const Quat& q)
     };
 }
 
-/// The branch of QuatFromMat3 for rotations by half a turn or nearly so: starts from the largest diagonal
-/// element.
+/// The branch of QuatFromMat3 for rotations by about half a turn; starts from the largest diagonal element.
 Quat QuatFromLargestDiagonal(const Mat3& m);
-/// The quaternion of a matrix with orthonormal rows; the rows are not made so here.
+/// Writes the quaternion of a matrix with orthonormal rows. The rows are not orthonormalized here.
 void QuatFromMat3(Quat& out, const Mat3& m);
 
 inline Quat QuatFromMat3(const Mat3& matrix)
@@ -65,17 +64,19 @@ inline Quat QuatFromMat3(const Mat3& matrix)
             static_cast<float>((static_cast<double>(m[1]) - m[3]) * k)};
 }
 
-/// From a at t = 0 to b at t = 1 the short way round. t is not clamped, the result is not normalised.
+/// Interpolates along the shorter arc from a (t = 0) to b (t = 1). t is not clamped, the result is not
+/// normalized.
 void QuatSlerp(Quat& out, float t, const Quat& a, const Quat& b);
 Quat QuatSlerp(float t, const Quat& a, const Quat& b);
 
-/// The points that QuatSlerp gives between two rotations. What they share is computed once.
+/// Interpolates repeatedly between the same two rotations, like QuatSlerp. The shared terms are computed
+/// once.
 class CQuatArc
 {
 public:
     CQuatArc(const Quat& a, const Quat& b);
 
-    /// QuatSlerp(t, a, b), bit for bit.
+    /// Returns QuatSlerp(t, a, b), bit for bit.
     Quat At(float t) const;
 
 private:
@@ -84,7 +85,7 @@ private:
     double m_fSign;
     double m_fTheta = 0.0;
     double m_fSinTheta = 0.0;
-    bool m_bIsStraight = true; // too short for an arc: a plain blend
+    bool m_bIsStraight = true; // too short for an arc: linear blend
 };
 
 } // namespace gw

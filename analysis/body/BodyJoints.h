@@ -7,12 +7,12 @@
 
 namespace gw {
 
-/// What a joint is in a human body.
+/// The role of a joint in a human body.
 enum class EBodyJoint : uint8_t
 {
     Hip,
-    Spine, ///< of several the highest, which carries the arms
-    Neck,  ///< of several the lowest
+    Spine, ///< the highest of several, which carries the arms
+    Neck,  ///< the lowest of several
     Head,
     Clavicle,
     UpperArm,
@@ -24,7 +24,7 @@ enum class EBodyJoint : uint8_t
     Toe,
 };
 
-/// One joint of a body. The side has no meaning for a joint of the trunk.
+/// A joint of a body. The side is unused for joints of the trunk.
 struct BodyPlace
 {
     EBodyJoint joint = EBodyJoint::Hip;
@@ -35,16 +35,16 @@ struct BodyPlace
 
 inline constexpr size_t kBodyPlaceCount = 20;
 
-/// All places of a body, from the hip upward, then arms and legs, the left one first.
+/// Returns all places of a body: from the hip upward, then arms and legs, left before right.
 const std::array<BodyPlace, kBodyPlaceCount>& BodyPlaces();
-/// The index of a place in BodyPlaces().
+/// Returns the index of a place in BodyPlaces().
 size_t IndexOf(BodyPlace place);
 
-/// The joint at a place, or null.
+/// Returns the joint at a place, or null.
 CNode* JointAt(const CBodyMap& body, BodyPlace place);
-/// Whether an arm or a leg holds the joint, so that there are two of it.
+/// Returns whether the joint belongs to an arm or a leg, so that there are two of it.
 bool HasSides(EBodyJoint joint);
-/// Whether a body cannot be driven without it: one of the thirteen.
+/// Returns whether a body cannot be driven without it: one of the thirteen required joints.
 bool IsNeeded(EBodyJoint joint);
 
 } // namespace gw

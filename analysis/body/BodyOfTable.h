@@ -7,10 +7,9 @@ namespace gw {
 class CNodeNames;
 class CRetargeter;
 
-/// The body that the rows of a retargeter's table tell of a source skeleton: what drives the target's bones,
-/// with the joints between hip, neck and head as the source's tree has them. A toe is the only child joint of
-/// a foot where no row names it. A torso bone that is driven from outside the spine (a collar) names no
-/// joint.
+/// Returns the body that the rows of a retargeter's table describe: the source joints that drive the target's
+/// bones, with the joints between hip, neck and head taken from the source's tree. If no row names a toe, it
+/// is the only child joint of the foot. A torso bone driven from outside the spine (a collar) adds no joint.
 CBodyMap BodyOfTable(const CRetargeter& table, const CNodeNames& targets);
 
 } // namespace gw

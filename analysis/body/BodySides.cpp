@@ -1,3 +1,7 @@
+// Decides which side of a body is its left one. Left is up x forward, and forward is where the feet point or,
+// less reliably, where the knees bend. Each pose votes with its weight; feet in a standing rest pose decide
+// alone, because nobody twists their hips there.
+
 #include "BodySides.h"
 
 #include "CJointTree.h"
@@ -12,14 +16,14 @@ namespace {
 
 using Leg = LegsOfBody::Leg;
 
-// A foot that goes on along the shin says nothing of where the body looks, nor does a straight knee.
+// A foot in line with the shin does not show where the body faces, nor does a straight knee.
 constexpr double kFootLeast = 0.25; // sine of the angle from the shin to the foot
 constexpr double kKneeLeast = 0.05; // sine of the knee's angle
 constexpr double kKneeSure = 0.35;
 constexpr double kAlongAtRest = 0.5; // cosine
 constexpr double kSureAtRest =
-    0.8; // of 2: both feet, as far as they point square to the line between the thighs
-// What the two say weighs differently: a knee is never bent the other way, but may turn outward.
+    0.8; // of 2: both feet, as far as they point perpendicular to the line between the thighs
+// Feet and knees have different weights: a knee never bends backward, but it can turn outward.
 constexpr float kKneeWeight = 0.7f;
 
 class CPose
@@ -32,7 +36,7 @@ public:
     Vec3 Up(const LegsOfBody& body) const { return Direction(body.hip, body.chest); }
     Vec3 Sideways(const LegsOfBody& body) const { return Direction(body.legs[1].thigh, body.legs[0].thigh); }
 
-    // Where a foot points beside its shin; zero where it says nothing.
+    // Returns where a foot points relative to its shin; zero if unclear.
     Vec3 FootForward(const Leg& leg) const
     {
         if (leg.ankle < 0)
@@ -41,7 +45,7 @@ public:
         const Vec3 part = Across(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
         return Vec3Length(part) > kFootLeast ? Vec3Normalized(part) : kVec3Zero;
     }
-    // Where a knee goes when it bends, longer for a greater bend up to 1.
+    // Returns where a bent knee moves; longer for a greater bend, up to 1.
     Vec3 KneeForward(const Leg& leg) const
     {
         const Vec3 ankle = leg.ankle >= 0 ? Place(leg.ankle) : tree_.Stances().Tip(m_uiStance, leg.knee);
@@ -66,7 +70,7 @@ private:
     size_t m_uiStance;
 };
 
-// The mean of what the poses say; poses that say nothing do not count.
+// Returns the mean over the poses that show anything.
 template <class Say>
 double MeanOfPoses(const CJointTree& tree, const Say& say)
 {
@@ -87,7 +91,8 @@ bool IsWhole(const LegsOfBody& body)
            std::ranges::all_of(body.legs, [](const Leg& leg) { return leg.thigh >= 0 && leg.knee >= 0; });
 }
 
-// Whether a body stands is asked of every profile that may fit; arms and feet say nothing of it.
+// Checks only trunk and legs, because this runs for every profile that may fit, and arms and feet do not
+// matter.
 bool StandsAtRest(const CJointTree& tree, const CBodyMap& body)
 {
     CBodyMap part;
@@ -136,7 +141,7 @@ double JudgeSides(const CJointTree& tree, const LegsOfBody& body)
     };
     const auto byFeet = [&](const CPose& pose) { return leftward(pose, pose.FeetForward(body)); };
     const auto byKnees = [&](const CPose& pose) { return leftward(pose, pose.KneesForward(body)); };
-    // Nobody twists the hips in a rest pose that is a stance.
+    // Nobody twists their hips in a standing rest pose.
     const double atRest = body.standsAtRest ? byFeet(CPose(tree, 0)) : 0.0;
     if (std::fabs(atRest) > kSureAtRest)
         return std::copysign(1.0, atRest);

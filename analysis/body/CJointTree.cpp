@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kNoLengthShare = 1e-4; // of all bones together
+constexpr double kNoLengthShare = 1e-4; // of the total bone length
 
 }
 

@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// A skeleton as the shape of a tree: indices of joints, lengths of bones, poses. Names are not looked at.
-/// Lengths are those of the rest pose or, where all of these are 0, of the first frame.
+/// A skeleton as the shape of a tree: joint indices, bone lengths, poses. Names are ignored. Lengths are from
+/// the rest pose or, if all of these are 0, from the first frame.
 class CJointTree
 {
 public:
@@ -22,22 +22,22 @@ public:
 
     int Parent(int joint) const { return m_kJoints[At(joint)].parent; }
     const std::vector<int>& Children(int joint) const { return m_kJoints[At(joint)].children; }
-    /// From the parent to a joint.
+    /// Returns the distance from a joint's parent to the joint.
     double Length(int joint) const { return m_kJoints[At(joint)].length; }
-    /// From an end joint to the end of its bone, 0 where there is none.
+    /// Returns the length of an end joint's bone, or 0.
     double TipLength(int joint) const { return m_kJoints[At(joint)].tipLength; }
-    /// The longest way from a joint's parent through the joint to an end of the tree.
+    /// Returns the longest path from a joint's parent through the joint to an end of the tree.
     double Reach(int joint) const { return m_kJoints[At(joint)].reach; }
-    /// The child with the longest reach, or kNone.
+    /// Returns the child with the longest reach, or kNone.
     int MainChild(int joint) const { return m_kJoints[At(joint)].mainChild; }
 
-    /// A joint and its main children down to the end, at most `most` of them.
+    /// Returns a joint and its main children down to the end, at most `most` of them.
     std::vector<int> MainChain(int joint, size_t most) const;
     bool IsAtOrBelow(int joint, int ancestor) const;
     int CommonAncestor(int a, int b) const;
-    /// The joints from below one to another that is below it; empty where it is not below.
+    /// Returns the joints on the path from one joint (excluded) down to another; empty if that is not below.
     std::vector<int> WayDown(int top, int bottom) const;
-    /// Whether a joint has one child alone, at its own place: the child does its work.
+    /// Returns whether a joint's only child is at the joint's own place and replaces it.
     bool HasStandIn(int joint) const;
 
 private:
@@ -57,8 +57,8 @@ private:
     void MeasureReaches();
 
     CStances m_kStances;
-    std::vector<Joint> m_kJoints; // parents before their children
-    double m_fNoLength = 0.0;     // bones up to here are none
+    std::vector<Joint> m_kJoints; // parents before children
+    double m_fNoLength = 0.0;     // shorter bones count as having no length
 };
 
 } // namespace gw

@@ -1,3 +1,8 @@
+// Checks a body map against the skeleton's geometry. The tree is checked first: each joint must be below the
+// joint that carries it, otherwise positions mean nothing. Then limbs: is there a clearly better choice of
+// upper arm or thigh in the same chain (FitLimb), are left and right swapped (BodySides), are bone lengths
+// plausible and symmetric? Thresholds are wide, because a doubt is shown to a user who chose the map.
+
 #include "CheckBody.h"
 
 #include "BodySides.h"
@@ -13,10 +18,10 @@ namespace gw {
 
 namespace {
 
-constexpr double kBetterChoice = 0.4; // by how much another choice must suit a limb better
-constexpr double kUneven = 1.5;       // left bone by right bone
+constexpr double kBetterChoice = 0.4; // how much cheaper another choice for a limb must be
+constexpr double kUneven = 1.5;       // ratio of left and right bone
 
-// What carries a joint: the first of these that the body has.
+// A joint's carrier: the first of these that the body has.
 struct Carrier
 {
     EBodyJoint joint;
@@ -50,7 +55,7 @@ const CNode* CarrierOf(const CBodyMap& body, BodyPlace place)
     return nullptr;
 }
 
-// The joints of one limb in a chain from the trunk outward.
+// The joints of one limb as a chain from the trunk outward.
 struct MappedLimb
 {
     std::vector<int> chain;
@@ -87,7 +92,7 @@ private:
 std::vector<BodyDoubt> CBodyChecker::Check()
 {
     CheckCarriers();
-    if (!m_kDoubts.empty()) // places say nothing of a tree that is none
+    if (!m_kDoubts.empty()) // positions mean nothing if the tree is wrong
         return m_kDoubts;
     CheckLegsDown();
     CheckSides();
@@ -140,10 +145,11 @@ void CBodyChecker::CheckSides()
         Doubt(EBodyDoubt::SidesSwapped, {UpperArm, EBodySide::Left});
 }
 
-// The chain begins below the trunk, where the other side's limb parts, and goes on behind the limb's end.
+// The chain starts below the trunk, where the other side's limb branches off, and continues past the limb's
+// end.
 MappedLimb CBodyChecker::LimbOf(ELimb limb, EBodySide side) const
 {
-    constexpr size_t kMostBehind = 1; // the knuckles, and not what is held in the hand
+    constexpr size_t kMostBehind = 1; // the knuckles, but nothing held in the hand
     constexpr size_t kLongestChain = 24;
     const bool isArm = limb == ELimb::Arm;
     const EBodyJoint first = isArm ? UpperArm : Thigh;

@@ -9,27 +9,27 @@ namespace gw {
 
 class CJointTree;
 
-/// What speaks against a joint being what a map of a body says.
+/// A reason why a joint may not be what a body map says.
 enum class EBodyDoubt : uint8_t
 {
-    NotBelow,      ///< it does not hang from the joint that should carry it
-    SidesSwapped,  ///< legs: left is not up x forward; arms: not on the sides of the legs
-    ClavicleIsArm, ///< what should be the upper arm lies a joint too far out: the clavicle is one
-    ArmIsClavicle, ///< what should be the upper arm is too short: it is the clavicle
-    LegsUp,        ///< the legs go the way of the trunk in every pose
-    OddLength,     ///< the bones of a limb are not in proportion, or not as long as those of the other side
+    NotBelow,      ///< not below the joint that should carry it
+    SidesSwapped,  ///< legs: left is not up x forward; arms: not on the same sides as the legs
+    ClavicleIsArm, ///< the mapped upper arm is one joint too far out; the clavicle is the real one
+    ArmIsClavicle, ///< the mapped upper arm is too short to be one: it is the clavicle
+    LegsUp,        ///< the legs point along the trunk in every pose
+    OddLength,     ///< a limb's bones are out of proportion, or differ in length from the other side's
 };
 
 struct BodyDoubt
 {
     EBodyDoubt kind = EBodyDoubt::NotBelow;
-    BodyPlace place; ///< of the joint concerned; the upper arm or thigh of a limb as a whole
+    BodyPlace place; ///< the joint concerned; for a whole limb, its upper arm or thigh
 };
 
-/// Doubts about a map of a body by the places of its joints over the rest pose and some frames; names are not
-/// looked at. Joints that are not there raise none. The tree is posed meanwhile and left as it was.
+/// Returns doubts about a body map, from the positions of its joints in the rest pose and some frames; names
+/// are ignored. Missing joints raise no doubts. The tree is posed during the call and restored.
 std::vector<BodyDoubt> CheckBody(const CBodyMap& body);
-/// The same with the skeleton's tree, which was looked at already.
+/// Same with the skeleton's tree, if it exists already.
 std::vector<BodyDoubt> CheckBody(const CBodyMap& body, const CJointTree& tree);
 
 } // namespace gw

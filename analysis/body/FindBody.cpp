@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// Joints that a body can do without are taken from the other map where they fit between their neighbours.
+// Adds optional joints from the other map if they fit between their neighbors.
 void AddMissing(CBodyMap& body, const CBodyMap& other)
 {
     for (const EBodySide side : kBodySides)

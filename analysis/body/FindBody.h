@@ -9,30 +9,30 @@
 
 namespace gw {
 
-/// What tells that a joint has its place in a body, from nothing to most.
+/// The evidence for a joint's role, from weakest to strongest.
 enum class EBodyEvidence : uint8_t
 {
     None,      ///< the skeleton has no such joint
-    Shape,     ///< places and lengths of bones, the names say nothing
-    ShapeOnly, ///< places and lengths of bones, against what the names say
-    Name,      ///< its name, the shape says nothing or something else
+    Shape,     ///< positions and bone lengths; the name says nothing
+    ShapeOnly, ///< positions and bone lengths, contradicting the name
+    Name,      ///< its name; the shape says nothing or contradicts
     Both,      ///< name and shape
 };
 
-/// A body that was found in a skeleton, and how surely.
+/// A body found in a skeleton, and the confidence in it.
 struct FoundBody
 {
-    CBodyMap body; ///< without the thirteen joints where none was found; see CBodyMap::DrivesBody
+    CBodyMap body; ///< lacks the thirteen required joints if no body was found; see CBodyMap::DrivesBody
     std::array<EBodyEvidence, kBodyPlaceCount> evidence{}; ///< in the order of BodyPlaces()
-    std::vector<BodyDoubt> doubts;                         ///< that are left
+    std::vector<BodyDoubt> doubts;                         ///< remaining doubts
     bool sidesAreSure = true; ///< the names or the poses show which side is the left one
 
     EBodyEvidence Evidence(BodyPlace place) const { return evidence[IndexOf(place)]; }
 };
 
-/// Finds the body of a skeleton: by the names of its joints where these give a whole body that the places of
-/// the joints do not contradict, else by its shape. What the one does not know the other may add. The tree is
-/// posed meanwhile and left as it was.
+/// Finds the body of a skeleton: by joint names if they describe a whole body that the positions do not
+/// contradict, otherwise by shape. Joints that one method misses are added from the other. The tree is posed
+/// during the call and restored.
 FoundBody FindBody(CNode& root);
 
 } // namespace gw

@@ -1,6 +1,6 @@
-// Names are read one by one (JointWords), then understood in company: the same word names different joints
-// in different families of skeletons. What the trunk does not say by name the tree says: the hip is where
-// legs and head part, the spine is the way from there to the neck.
+// Names are read one by one (JointWords) and then interpreted together, because the same word names different
+// joints in different families of skeletons. Where the trunk's names are unclear, the tree decides: the hip
+// is where legs and head branch, and the spine is the path from there to the neck.
 
 #include "FindBodyByNames.h"
 
@@ -23,11 +23,11 @@ struct Candidate
     JointName name;
     size_t depth = 0;
 
-    // The joint itself comes before what helps it, the first of several before the others.
+    // A joint comes before its helpers, and the first of several before the others.
     auto Order() const { return std::tuple(name.helper, name.number, depth); }
 };
 
-// What the names of a skeleton say, by word and side.
+// The named joints of a skeleton, by word and side.
 class CNamedJoints
 {
 public:
@@ -37,7 +37,7 @@ public:
     {
         return m_kBest[static_cast<size_t>(word)][static_cast<size_t>(side)].node;
     }
-    /// The deepest joint of the trunk with a word, or null.
+    /// Returns the deepest joint of the trunk with a word, or null.
     CNode* FindDeepest(EJointWord word) const;
     bool Says(const CNode* node, EJointWord word) const;
 
@@ -101,7 +101,7 @@ CNode* FirstOf(std::initializer_list<CNode*> nodes)
     return found == nodes.end() ? nullptr : *found;
 }
 
-// LeftShoulder is the clavicle where a LeftArm or an upper arm is, else the upper arm.
+// LeftShoulder is the clavicle if there is a LeftArm or another upper arm, otherwise the upper arm.
 BodyArm ArmOf(const CNamedJoints& joints, ENameSide side)
 {
     using enum EJointWord;
@@ -112,8 +112,7 @@ BodyArm ArmOf(const CNamedJoints& joints, ENameSide side)
             FirstOf({find(Wrist), find(Hand)})};
 }
 
-// LeftLeg is the shin where something else is the thigh; LeftFoot is the toe's joint where LeftAnkle is the
-// foot's.
+// LeftLeg is the shin if something else is the thigh. LeftFoot is the toe if LeftAnkle is the foot.
 BodyLeg LegOf(const CNamedJoints& joints, ENameSide side)
 {
     using enum EJointWord;
@@ -125,7 +124,7 @@ BodyLeg LegOf(const CNamedJoints& joints, ENameSide side)
             FirstOf({find(Toe), ankle ? find(Foot) : nullptr})};
 }
 
-// Rigs that call the whole trunk spine have its last joint as the head, as has a neck without a head.
+// In rigs that call the whole trunk spine, or have a neck but no head, the last such joint is the head.
 CNode* HeadOf(const CNamedJoints& joints, const CNode* chest)
 {
     using enum EJointWord;
@@ -134,7 +133,7 @@ CNode* HeadOf(const CNamedJoints& joints, const CNode* chest)
     return named ? named : last != chest && IsAtOrBelow(last, chest) ? last : nullptr;
 }
 
-// The joint with the hip's name, unless legs or head do not hang from it: then where they part.
+// Returns the joint named hip, or, if legs or head are not below it, the joint where they branch.
 CNode* HipOf(const CNamedJoints& joints, const CBodyMap& body)
 {
     CNode* const legs = CommonAncestor(body.legs[0].thigh, body.legs[1].thigh);
@@ -144,7 +143,8 @@ CNode* HipOf(const CNamedJoints& joints, const CBodyMap& body)
     return named && carriesBody ? named : parting;
 }
 
-// The way from hip to head: spine up to the first joint called neck, else up to where the arms part.
+// Fills the path from hip to head: spine up to the first joint named neck, otherwise up to where the arms
+// branch.
 void FillTrunk(const CNamedJoints& joints, const CNode* chest, CBodyMap& body)
 {
     const std::vector<CNode*> way = NodesBetween(body.hip, body.head);

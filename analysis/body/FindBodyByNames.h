@@ -4,9 +4,9 @@
 
 namespace gw {
 
-/// The body that the names of a skeleton's joints tell, read by a grammar of words and not by a list of
-/// skeletons; the tree only says in what order the spine goes. Roles that no name tells stay empty. Twist,
-/// roll and end joints, fingers and single toes are never taken.
+/// Returns the body that the joint names describe, read with a grammar of words instead of a list of known
+/// skeletons. The tree only provides the order of the spine. Unnamed roles stay empty. Twist, roll and end
+/// joints, fingers and single toes are never used.
 CBodyMap FindBodyByNames(CNode& root);
 
 } // namespace gw

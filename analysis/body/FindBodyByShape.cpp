@@ -1,3 +1,24 @@
+// Finds a human body in a tree of joints whose names mean nothing.
+//
+// The idea: a body is the only thing in a skeleton with two pairs of long mirrored limbs. FindLimbPairs lists
+// pairs of chains that leave one joint and match bone for bone. FitLimb rates each pair as arms and as legs:
+// which joints would begin its two long bones, and at what cost. All combinations of two pairs are then
+// scored, and the best one wins, provided that something rises between the arms that can be a neck.
+// Everything else follows: the hip is where the legs meet the trunk, the spine is the path from there to the
+// arms, and the neck is the branch that rises highest.
+//
+// The score is the total limb length, reduced by the cost of both fits (a fit of cost 1 loses a quarter) and
+// raised if legs are longer than arms and closer to the root. Length dominates on purpose: fingers, ears and
+// skirts mirror each other too, but are short. Ratios such as kLongestNeckBone are fractions of a leg and
+// were measured on skeletons from many programs, so units do not matter.
+//
+// Rest poses can be useless, with all bones on a line or the legs folded up. So "up" is measured over the
+// rest pose and several frames. Left and right come from feet and knees (BodySides); if these show nothing,
+// left is +x and the caller is told that the sides are a guess.
+//
+// The number of pairs is limited (kMostPairs in LimbPairs.cpp) and chains are finite, so even a tree with
+// thousands of joints ends after a few hundred combinations.
+
 #include "FindBodyByShape.h"
 
 #include "BodySides.h"
@@ -13,7 +34,7 @@ namespace gw {
 
 namespace {
 
-// A pair of chains as arms or legs.
+// A pair of chains, interpreted as arms or legs.
 struct Limbs
 {
     LimbPair pair;
@@ -29,7 +50,7 @@ struct Limbs
     int End(size_t side) const { return Joint(side, fit.joints.end); }
 };
 
-// Which pair is the legs and which the arms.
+// The choice of legs and arms.
 struct FoundLimbs
 {
     Limbs legs;
@@ -43,10 +64,10 @@ bool IsInChains(const CJointTree& tree, int joint, const LimbPair& pair)
         pair.chains, [&](const std::vector<int>& chain) { return tree.IsAtOrBelow(joint, chain.front()); });
 }
 
-// How high a branch rises over the joint that it leaves, away from the legs, summed over all poses.
+// Returns how high a branch rises above its joint, away from the legs, summed over all poses.
 double RiseOf(const CJointTree& tree, const FoundLimbs& limbs, int branch)
 {
-    constexpr size_t kDeepest = 8; // joints of neck and head: a plait hangs down again
+    constexpr size_t kDeepest = 8; // joints of neck and head; a longer chain may be a plait that hangs down
     const CStances& stances = tree.Stances();
     const std::vector<int> chain = tree.MainChain(branch, kDeepest);
     double rise = 0.0;
@@ -65,7 +86,7 @@ double RiseOf(const CJointTree& tree, const FoundLimbs& limbs, int branch)
     return rise;
 }
 
-// The branch of the chest that goes on to the head: what rises highest beside the arms.
+// Returns the branch of the chest that leads to the head: the one that rises highest, except the arms.
 int FindNeck(const CJointTree& tree, const FoundLimbs& limbs)
 {
     const LimbPair& arms = limbs.arms.pair;
@@ -85,8 +106,7 @@ int FindNeck(const CJointTree& tree, const FoundLimbs& limbs)
     return neck;
 }
 
-// How well two pairs suit: long limbs, and legs that are the longer ones, nearer to the root, and that have
-// no head beside them.
+// Rates a choice of two pairs: long limbs, with legs that are longer and closer to the root.
 double ScoreLimbs(const CJointTree& tree, const FoundLimbs& found)
 {
     constexpr double kCostWeight = 0.25;
@@ -129,12 +149,12 @@ FoundLimbs FindLimbs(const CJointTree& tree)
     return best;
 }
 
-// The joint of a chain from the chest upward that carries the skull: the first that branches, else the last,
-// unless that only marks the top of the head.
+// Returns the joint, in a chain from the chest upward, that carries the skull: the first one that branches,
+// otherwise the last, unless that is only a marker at the top of the head.
 size_t FindHead(const CJointTree& tree, const std::vector<int>& chain, double leg)
 {
     constexpr double kLongestNeckBone = 0.21; // of a leg; skulls are longer
-    constexpr double kSkullShare = 1.35;      // of the bone before
+    constexpr double kSkullShare = 1.35;      // of the previous bone
     size_t last = 0;
     while (last + 1 < chain.size() && tree.Children(chain[last]).size() < 2)
         ++last;
@@ -168,10 +188,10 @@ void FillTrunk(const CJointTree& tree, const FoundLimbs& limbs, CBodyMap& body)
     body.head = tree.Node(chain[head]);
 }
 
-// Of the joints before the upper arm the first that is as long as a clavicle: helpers come before it.
+// Returns the first joint before the upper arm that is as long as a clavicle; shorter ones are helpers.
 int FindClavicle(const CJointTree& tree, const Limbs& arms, size_t side)
 {
-    constexpr double kAsLong = 0.75; // of the longest of them
+    constexpr double kAsLong = 0.75; // of the longest one
     const std::vector<int>& chain = arms.pair.chains[side];
     const auto boneOf = [&](size_t stop) { return tree.Length(chain[stop + 1]); };
     double longest = 0.0;
@@ -185,7 +205,7 @@ int FindClavicle(const CJointTree& tree, const Limbs& arms, size_t side)
     return CJointTree::kNone;
 }
 
-// The first joint behind the ankle that is a good way from it.
+// Returns the first joint after the ankle that is clearly apart from it.
 int FindToe(const CJointTree& tree, const Limbs& legs, size_t side)
 {
     constexpr double kShortestFoot = 0.03; // of a leg
@@ -213,15 +233,15 @@ BodyLeg LegOf(const CJointTree& tree, const Limbs& legs, size_t side)
             tree.Node(FindToe(tree, legs, side))};
 }
 
-// Where no pose shows which way the body looks, left is +x: most files face +z with y up, the others -y with
-// z up.
+// Used if no pose shows where the body faces: left is +x, because most files face +z with y up, and the
+// others -y with z up.
 double SidesByHabit(const CJointTree& tree, const LegsOfBody& legs)
 {
     const CStances& stances = tree.Stances();
     return stances.Place(0, legs.legs[0].thigh).x - stances.Place(0, legs.legs[1].thigh).x;
 }
 
-// Brings the sides of the limbs, so far in the order of the file, to left and right.
+// Sorts the limbs, so far in file order, into left and right.
 bool SortSides(const CJointTree& tree, CBodyMap& body)
 {
     const LegsOfBody legs = LegsOf(tree, body);

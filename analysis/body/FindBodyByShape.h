@@ -6,12 +6,12 @@ namespace gw {
 
 class CJointTree;
 
-/// The body that the shape of a skeleton tells, whatever its joints are called: two pairs of mirrored limbs,
-/// the spine between them, the head beyond. Left is up x forward, which feet or knees show. An empty map
-/// where no body is in it. The tree is posed meanwhile and left as it was.
+/// Returns the body in a skeleton, found by shape alone: two pairs of mirrored limbs, the spine between them,
+/// the head above. Left is up x forward, as shown by feet or knees. Empty if there is no body. The tree is
+/// posed during the call and restored.
 CBodyMap FindBodyByShape(CNode& root);
-/// The same for a tree that was looked at already. `sidesAreSure` tells whether the poses show left and
-/// right; else the left leg is taken to stand at +x.
+/// Same for an existing joint tree. `sidesAreSure` is set if the poses show left and right; otherwise the leg
+/// at +x is assumed to be the left one.
 CBodyMap FindBodyByShape(const CJointTree& tree, bool& sidesAreSure);
 
 } // namespace gw

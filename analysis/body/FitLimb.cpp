@@ -1,7 +1,11 @@
-// A limb has two long bones of about equal length that make up most of it. What stands before them (a
-// clavicle, a helper at the hip) and behind (hand, foot) is short. Twist joints lie on a bone's line in every
-// pose; a choice that runs a bone over a joint that bends pays for the bend. All this holds in any pose and
-// any unit.
+// A limb has two long bones of about equal length that make up most of it. The part before them (a clavicle,
+// a helper at the hip) and the part after them (hand, foot) are short. Twist joints are on a bone's line in
+// every pose, so a choice whose bone passes a joint that bends pays for the bend. All this holds in any pose
+// and any unit.
+//
+// FitLimb tries every triple of joints in a chain, at most a few hundred, and returns the cheapest. A cost of
+// 0 is a perfect limb; each violated expectation adds up to kMostOfOnePart, and the share of the chain that
+// the two bones cover is subtracted, so good fits are negative.
 
 #include "FitLimb.h"
 
@@ -14,15 +18,16 @@ namespace gw {
 
 namespace {
 
-// What of a limb is usual, and what straying costs. Ratios are of lengths; found on skeletons of many makers.
+// The usual proportions of a limb and the cost of deviating. Values are length ratios, found on skeletons
+// from many programs.
 struct Norms
 {
     double ratio;        // natural logarithm of upper by lower bone
-    double before;       // the way before the upper bone, of both bones
-    double beforeWeight; // for what is longer
-    double behind;       // the same for what comes behind the lower bone
+    double before;       // distance before the upper bone, relative to both bones
+    double beforeWeight; // if it is longer
+    double behind;       // distance after the lower bone, relative to both bones
     double behindWeight;
-    double spread; // half the way between both sides' upper bones, of both bones
+    double spread; // half the distance between both sides' upper bones, relative to both bones
 };
 constexpr Norms kArmNorms{0.12, 0.60, 1.5, 0.45, 2.5, 0.34};
 constexpr Norms kLegNorms{0.04, 0.20, 1.5, 0.40, 2.5, 0.12};
@@ -31,8 +36,8 @@ constexpr double kMostOfSpread = 0.6;
 constexpr double kMostOfOnePart = 1.5;
 constexpr double kBendWeight = 4.0;
 constexpr double kShareWeight = 1.0;
-constexpr double kPassedJoint = 0.1;  // a bone seldom has joints inside
-constexpr double kPassedBranch = 0.5; // and never one that fingers or toes leave from
+constexpr double kPassedJoint = 0.1;  // bones seldom contain joints
+constexpr double kPassedBranch = 0.5; // and never one where fingers or toes branch off
 constexpr double kAsLongBranch = 0.6; // of the longest; twist joints beside a bone reach half of it
 
 const Norms& NormsOf(ELimb limb)
@@ -45,7 +50,7 @@ double Capped(double cost)
     return std::clamp(cost, 0.0, kMostOfOnePart);
 }
 
-// One chain as a line of stops: its joints and, behind the last of them, the end of its bone.
+// A chain as a line of stops: its joints and, after the last one, the end of its bone.
 class CLine
 {
 public:
@@ -58,7 +63,7 @@ public:
     }
 
     size_t LastStop() const { return chain_.size(); }
-    // What it costs a bone that its inner joints are passed over.
+    // Returns the cost of a bone that passes over inner joints.
     double PassedCost(size_t from, size_t to) const
     {
         double cost = 0.0;
@@ -68,7 +73,8 @@ public:
     }
     double Way(size_t from, size_t to) const { return m_kWay[to] - m_kWay[from]; }
     double WayBehind(size_t stop) const { return m_kWay.back() - m_kWay[stop]; }
-    // By how much the way between two stops is longer than the straight line, in the pose that bends it most.
+    // Returns how much longer the path between two stops is than the straight line, in the pose with the
+    // strongest bend.
     double Bend(size_t from, size_t to) const
     {
         if (to - from < 2)
@@ -128,9 +134,9 @@ LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)
     return fit;
 }
 
-// What it costs that the upper bones of both sides begin too near to each other, or too far, in the pose
-// where they are farthest: a chain of helpers and twist joints in a straight arm shows no better where it
-// begins.
+// Returns the cost of upper bones that start too close to each other or too far apart, in the pose in which
+// they are farthest apart. It is needed because a straight arm made of helpers and twist joints does not
+// otherwise show where it starts.
 double SpreadCost(const CLine& a, const CLine& b, double norm, const LimbJoints& joints)
 {
     double widest = 0.0;
@@ -147,7 +153,7 @@ double SpreadCost(const CLine& a, const CLine& b, double norm, const LimbJoints&
     return std::min(cost, kMostOfSpread);
 }
 
-// The mean of both sides.
+// Returns the mean of both sides.
 LimbFit Judge(const std::vector<CLine>& lines, const Norms& norms, const LimbJoints& joints)
 {
     LimbFit all{joints, 0.0, 0.0, true};
@@ -184,7 +190,7 @@ LimbFit FitLimb(const CJointTree& tree, LimbChains chains, ELimb limb)
     const std::vector<CLine> lines = LinesOf(tree, chains);
     const std::vector<int>& chain = chains.front();
     const auto isHelper = [&](size_t stop) { return stop < chain.size() && tree.HasStandIn(chain[stop]); };
-    // A hand cannot do without a joint; a leg may end where the shin's bone does.
+    // A hand needs a joint; a leg can end where the shin bone ends.
     const size_t lastStop = limb == ELimb::Arm ? chain.size() - 1 : chain.size();
     LimbFit best;
     for (size_t upper = 0; upper < chain.size(); ++upper)

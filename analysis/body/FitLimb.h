@@ -15,18 +15,18 @@ enum class ELimb : uint8_t
     Leg,
 };
 
-/// Which joints of a chain begin the upper and the lower bone of a limb and what is at its end: upper arm,
-/// forearm and hand, or thigh, shin and foot. Indices into the chain.
+/// The joints of a chain where the upper and lower bone of a limb start and end: upper arm, forearm and hand,
+/// or thigh, shin and foot. Indices into the chain.
 struct LimbJoints
 {
     size_t upper = 0;
     size_t lower = 0;
-    size_t end = 0; ///< the number of joints where the lower bone ends in no joint
+    size_t end = 0; ///< the chain's size if the lower bone does not end in a joint
 
     friend bool operator==(const LimbJoints&, const LimbJoints&) = default;
 };
 
-/// How well such a choice suits a human limb; the lower the better, below 0 for a good one.
+/// How well a choice fits a human limb; lower is better, and good ones are below 0.
 struct LimbFit
 {
     LimbJoints joints;
@@ -35,13 +35,13 @@ struct LimbFit
     bool found = false;
 };
 
-/// Chains of joints, each the child of the one before, that stand for the same limb on both sides and have as
-/// many joints; or one chain alone.
+/// Chains of joints, each the child of the previous one, for the same limb on both sides and with the same
+/// number of joints; or a single chain.
 using LimbChains = std::span<const std::vector<int>>;
 
-/// The best choice there is.
+/// Returns the best choice.
 LimbFit FitLimb(const CJointTree& tree, LimbChains chains, ELimb limb);
-/// What a given choice costs. Not found where a bone has no length.
+/// Returns the cost of a given choice. Not found if a bone has no length.
 LimbFit JudgeLimb(const CJointTree& tree, LimbChains chains, ELimb limb, const LimbJoints& joints);
 
 } // namespace gw

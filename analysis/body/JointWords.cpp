@@ -1,6 +1,6 @@
-// A joint's name is cut into words of a small lexicon. Each word is a set of features ("calf" is lower and
-// leg, as "LoLeg" is), the name is the union of its words' features, and a table tells which unions name a
-// joint. What is not in the lexicon makes the whole name unknown: so twist bones, end joints, fingers and
+// A joint's name is split into words of a small lexicon. Each word is a set of features ("calf" is lower and
+// leg, and so is "LoLeg"), the name is the union of its words' features, and a table lists which unions name
+// a joint. A word outside the lexicon makes the whole name unknown, so twist bones, end joints, fingers and
 // faces need no list.
 
 #include "JointWords.h"
@@ -117,17 +117,17 @@ constexpr Word kLexicon[] = {
     {"toe",      kToe        },
     {"toes",     kToe        },
     {"ball",     kToe        },
-    {"bale",     kToe        }, // the ball, misspelt in a rig that is about
+    {"bale",     kToe        }, // the ball, misspelled in a widespread rig
 };
 
 constexpr uint32_t kSides = kLeft | kRight;
 constexpr uint32_t kLevels = kUp | kLow | kMid;
 
-// A set of features names a joint when it has all that are needed and no more than may be there.
+// Features name a joint if they include all needed ones and none that are not allowed.
 struct Meaning
 {
     uint32_t needed;
-    uint32_t allowed; // beside those needed
+    uint32_t allowed; // in addition to those needed
     EJointWord word;
 };
 
@@ -165,8 +165,8 @@ constexpr Meaning kSideMeanings[] = {
 
 constexpr size_t kLongestToken = 48; // longer than any joint's words in a row
 
-// The features of a run of letters that consists of the lexicon's words alone, as few as can be, so that
-// "upperarm" is not "up", "per" and "arm". Nothing where it does not.
+// Returns the features of a run of letters that consists only of lexicon words, using as few as possible, so
+// that "upperarm" is not "up", "per" and "arm". Nothing if it contains anything else.
 std::optional<uint32_t> Features(std::string_view token)
 {
     if (token.size() > kLongestToken)
@@ -176,7 +176,7 @@ std::optional<uint32_t> Features(std::string_view token)
         size_t words;
         uint32_t features;
     };
-    std::array<std::optional<Part>, kLongestToken + 1> parts; // of the first so many letters
+    std::array<std::optional<Part>, kLongestToken + 1> parts; // of the first n letters
     parts[0] = Part{0, kNothing};
     for (size_t begin = 0; begin < token.size(); ++begin)
     {
@@ -184,8 +184,7 @@ std::optional<uint32_t> Features(std::string_view token)
             continue;
         for (const Word& word : kLexicon)
         {
-            // Nearly all words differ in the first letter, and this is the inner loop of every search by
-            // names.
+            // Most words differ in the first letter, and this is the inner loop of every search by names.
             if (word.text.front() != token[begin] || !token.substr(begin).starts_with(word.text))
                 continue;
             std::optional<Part>& part = parts[begin + word.text.size()];
@@ -208,11 +207,11 @@ std::optional<uint32_t> With(std::optional<uint32_t> features, uint32_t more)
     return features && more ? std::optional(*features | more) : std::nullopt;
 }
 
-// The same for a token that may have the letter of a side stuck to it, or be it.
+// Same for a token that can include a letter for the side, or consist of it.
 std::optional<uint32_t> TokenFeatures(std::string_view token)
 {
     if (token == "c")
-        return kNothing; // the letter of the middle, beside L and R
+        return kNothing; // the letter for the middle, besides L and R
     if (const auto whole = Features(token))
         return whole;
     if (const auto front = With(Features(token.substr(1)), SideLetter(token.front())))
@@ -227,7 +226,7 @@ bool IsDigit(char c)
 
 bool IsLetter(char c)
 {
-    return (c >= 'a' && c <= 'z') || (c & 0x80) != 0; // foreign letters are letters of unknown words
+    return (c >= 'a' && c <= 'z') || (c & 0x80) != 0; // non-ASCII letters belong to unknown words
 }
 
 template <class Is>
@@ -241,7 +240,7 @@ std::string_view TakeWhile(std::string_view& rest, Is is)
     return taken;
 }
 
-// A name as the features of its words. Nothing where a word is unknown or two numbers make it one of many.
+// Returns the features of a name's words. Nothing if a word is unknown or two numbers mark it as one of many.
 std::optional<uint32_t> NameFeatures(std::string_view rest, int& number)
 {
     uint32_t features = kNothing;

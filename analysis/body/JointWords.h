@@ -6,19 +6,19 @@
 
 namespace gw {
 
-/// What a name can say of a joint, before the other names tell what it means in their company: a "shoulder"
-/// is a clavicle beside an upper arm and an upper arm beside a clavicle.
+/// What a single name can mean, before the other names decide: a "shoulder" is a clavicle if there is an
+/// upper arm, and an upper arm if there is a clavicle.
 enum class EJointWord : uint8_t
 {
     None,
-    // In the middle of the body.
+    // Of the trunk.
     Hip,
-    HipBase, ///< the foot of the spine, where nothing is called hip
+    HipBase, ///< the base of the spine, if nothing is called hip
     Spine,
     Neck,
     Head,
     HeadEnd,
-    // On a side.
+    // Of one side.
     Clavicle,
     Shoulder,
     UpperArm,
@@ -43,18 +43,18 @@ enum class ENameSide : uint8_t
     Right,
 };
 
-/// A joint's name as it is understood.
+/// An interpreted joint name.
 struct JointName
 {
     EJointWord word = EJointWord::None;
     ENameSide side = ENameSide::None;
-    int number = -1;     ///< -1 for none
-    bool helper = false; ///< marked as a joint that only helps another one of the same name
+    int number = -1;     ///< -1 without a number
+    bool helper = false; ///< a helper of another joint with the same name
 };
 
-/// Reads a name that has no namespace any more: words in any case, run together or with anything but letters
-/// and digits between them, a side at the front, at the back or in between as a word or a letter, one number.
-/// A name with a word that belongs to no joint of a body (twist, end, thumb, prop) says nothing.
+/// Interprets a name without namespace: words in any case, joined or separated by anything but letters and
+/// digits; a side at the front, at the end or in between, as a word or a letter; one number. A name with a
+/// word that is not part of a body joint (twist, end, thumb, prop) has no meaning.
 JointName ReadJointName(std::string_view name);
 
 } // namespace gw

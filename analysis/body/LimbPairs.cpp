@@ -9,16 +9,16 @@ namespace gw {
 
 namespace {
 
-// A body's limbs are among the longest chains, so a wild tree costs no more than a large one.
+// A body's limbs are among the longest chains. The limit keeps an unusual tree as fast as a large one.
 constexpr size_t kMostPairs = 24;
-constexpr size_t kMostBranches = 8; // of one joint
+constexpr size_t kMostBranches = 8; // per joint
 constexpr size_t kLongestChain = 20;
 constexpr size_t kLeastJoints = 2;
-// Of the longest way through the tree. Arms are a third of it, even beside a long thing in a hand.
+// Of the longest path through the tree. Arms are a third of it, even next to a long object in a hand.
 constexpr double kLeastReach = 0.08;
-// Measured skeletons differ from left to right.
+// Real skeletons differ between left and right.
 constexpr double kMostDifference = 0.25; // of the longer of two bones
-constexpr double kAnyDifference = 0.03;  // of the whole limb: short bones may differ by much
+constexpr double kAnyDifference = 0.03;  // of the whole limb: short bones can differ a lot
 
 std::vector<int> LongBranches(const CJointTree& tree, int joint)
 {

@@ -7,15 +7,15 @@ namespace gw {
 
 class CJointTree;
 
-/// Two chains of joints that mirror each other: bone for bone as long, under one joint.
+/// Two chains of joints that mirror each other: equal bone lengths, starting at one joint.
 struct LimbPair
 {
-    int joint = -1;                         ///< from which both leave
-    std::array<std::vector<int>, 2> chains; ///< as far as they mirror each other, as many joints each
-    double length = 0.0;                    ///< of one, from the joint on
+    int joint = -1;                         ///< where both branch off
+    std::array<std::vector<int>, 2> chains; ///< as far as they mirror each other; equal numbers of joints
+    double length = 0.0;                    ///< of one chain, starting at the joint
 };
 
-/// The pairs of a tree that may be limbs, the longest first.
+/// Returns the pairs of a tree that can be limbs, longest first.
 std::vector<LimbPair> FindLimbPairs(const CJointTree& tree);
 
 } // namespace gw

@@ -1,3 +1,6 @@
+// Finds the prefix that a program or rig puts before every joint name. A candidate is a start shared by many
+// names; it is a prefix if more names can be interpreted without it than with it.
+
 #include "NamePrefix.h"
 
 #include "JointWords.h"
@@ -10,11 +13,11 @@ namespace gw {
 
 namespace {
 
-// Starts are tried on every name, so both are bounded: a body's joints are among the first, and no prefix is
-// longer than a short title.
+// Candidates are tried on every name, so both numbers are limited: a body's joints are among the first, and
+// no prefix is longer than a short title.
 constexpr size_t kNamesLooked = 256;
 constexpr size_t kLongestPrefix = 32;
-// A prefix is a habit of the skeleton: so many joints at least have it, and a third of those looked at.
+// A prefix is systematic: at least this many joints have it, and a third of those examined.
 constexpr size_t kLeastNames = 8;
 
 bool IsWordCharacter(char c)
@@ -27,8 +30,9 @@ bool IsUnderstood(std::string_view name)
     return ReadJointName(name).word != EJointWord::None;
 }
 
-// The starts that enough names share, in order. Sorted, the names that share one are neighbors, so that it is
-// enough to look at the ends of a window. A name that is nothing but the start does not count.
+// Returns the starts shared by enough names, in order. In sorted order, names with the same start are
+// neighbors, so it is enough to compare the ends of a window. A name that consists only of the start does not
+// count.
 std::vector<std::string> SharedStarts(std::span<const std::string_view> names)
 {
     std::vector<std::string> sorted;
@@ -56,8 +60,8 @@ std::vector<std::string> SharedStarts(std::span<const std::string_view> names)
     return starts;
 }
 
-// How many names are understood without a prefix, or 0 once it is clear that they are fewer than `least`.
-// Most prefixes are none, and the first few names show it.
+// Counts the names that can be interpreted without a prefix; 0 as soon as there must be fewer than `least`.
+// Most candidates fail within the first few names.
 class CUnderstoodNames
 {
 public:
@@ -100,7 +104,7 @@ std::string FindNamePrefix(std::span<const std::string_view> names)
     size_t most = understood.CountWhole();
     for (std::string& start : SharedStarts(names))
     {
-        // What separates a prefix from the name belongs to the prefix.
+        // A separator between prefix and name belongs to the prefix.
         const bool closes = !best.empty() && start.starts_with(best) && !IsWordCharacter(start.back());
         const size_t least = closes ? most : most + 1;
         const size_t count = understood.CountWithout(start, least);

@@ -6,15 +6,15 @@
 
 namespace gw {
 
-/// What follows the last colon of a name, or the name.
+/// Returns the part of a name after its last colon, or the whole name.
 std::string_view WithoutNamespace(std::string_view name);
 
-/// The start that a good part of the names have in common and that is no word of a joint: "Model_", "DEF-",
-/// "J_Bip_", "mixamorig", "m". In lower case. Of all such starts the one without which most names say what
-/// they are, empty where none helps. The names have no namespace any more.
+/// Returns the start, in lower case, that many of the names share and that is not part of a joint's name:
+/// "Model_", "DEF-", "J_Bip_", "mixamorig", "m". Of several, the one whose removal makes the most names
+/// meaningful; empty if none helps. The names must have no namespace.
 std::string FindNamePrefix(std::span<const std::string_view> names);
 
-/// A name without that prefix where it has it, without regard to case.
+/// Returns a name without that prefix, if it has it, ignoring case.
 std::string_view WithoutPrefix(std::string_view name, std::string_view prefix);
 
 } // namespace gw

@@ -16,37 +16,37 @@ namespace gw {
 
 class CLineCursor;
 
-/// The text of a BVH file under examination: what is wrong with it as it stands, whether or not a reader
-/// takes it, and how it would stand mended.
+/// The text of a BVH file under examination: its faults, whether or not a reader accepts it, and its repaired
+/// form.
 class CBVHExam
 {
 public:
     explicit CBVHExam(CFindings& findings) : findings_(findings) {}
 
-    /// Reads the whole text. None on success, else why there is none to examine.
+    /// Reads the whole text. Returns None on success, otherwise why it cannot be examined.
     EFailure Examine(const std::string& path);
-    /// Gives back the memory of the text, which is read again where it is needed.
+    /// Releases the memory of the text, which is read again when needed.
     void Forget() { m_kFile.Forget(m_kFile.Text().size()); }
-    /// Whether the file still has all the bytes that were examined.
+    /// Returns whether the file still has all the bytes that were examined.
     bool IsWhole() const { return m_kFile.IsWhole(); }
-    /// What the text says before its rows.
+    /// Returns the structure of the text before its rows.
     const BVHOutline& Outline() const { return m_kOutline; }
-    /// Writes the text with all mendable faults gone. False when the file cannot be written; the old one
-    /// stands then.
+    /// Writes the text with all repairable faults fixed. If the file cannot be written, returns false and
+    /// keeps the old one.
     bool WriteMended(const std::string& path);
 
 private:
     void ReadRows(CLineCursor& lines);
 
     CMappedFile m_kFile;
-    std::string m_kClean; // the text, where bytes of the file had to go
+    std::string m_kClean; // the text, if bytes of the file had to be removed
     std::string_view m_kText;
     CFindings& findings_;
     CTextEdits m_kEdits;
     BVHOutline m_kOutline;
     RowPlan m_kPlan;
     std::vector<MendedCell> m_kCells;
-    bool m_bRows = false; // there are rows that were understood
+    bool m_bRows = false; // rows were found and understood
 };
 
 } // namespace gw

@@ -29,7 +29,7 @@ void CFileExam::ExamineBVH(const std::string& path)
     CMotionFile motion;
     if (motion.Load(path))
         facts_ = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
-    // What the text is said to have wrong is what the reader tripped over.
+    // Faults found in the text are the ones that made the reader fail.
     else if (!m_kFindings.HasErrors())
         m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
 }
@@ -48,7 +48,7 @@ void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record
         m_kFindings.AddReader(record.Failure(), ESeverity::Error);
     for (const CFailure& warning : record.Warnings())
     {
-        if (warning.reason != EFailure::RestPose) // one of the facts
+        if (warning.reason != EFailure::RestPose) // reported with the facts
             m_kFindings.AddReader(warning, ESeverity::Warning);
     }
 }

@@ -7,7 +7,7 @@ namespace gw {
 
 namespace {
 
-constexpr std::ptrdiff_t kKept = 5; // places of one fault
+constexpr std::ptrdiff_t kKept = 5; // places per fault
 
 bool IsFault(const Finding& finding)
 {

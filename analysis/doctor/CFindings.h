@@ -13,33 +13,33 @@ namespace gw {
 struct Finding
 {
     EFault fault = EFault::Reader;
-    size_t where = 0; ///< line from 1 on of a text, byte of a container; 0 where there is none
-    std::string name; ///< joint, keyword or text concerned; may be empty
+    size_t where = 0; ///< line of a text, starting at 1, or byte of a container; 0 if unknown
+    std::string name; ///< the joint, keyword or text concerned; can be empty
     ESeverity severity = ESeverity::Error;
-    bool mendable = false;            ///< a mended copy is free of it
-    EFailure reason = EFailure::None; ///< what the reader said, for EFault::Reader
-    size_t more = 0;                  ///< further findings like this one, which are only counted
+    bool mendable = false;            ///< fixed in a repaired copy
+    EFailure reason = EFailure::None; ///< the reader's reason, for EFault::Reader
+    size_t more = 0;                  ///< number of further findings like this one
 };
 
-/// What was found in a file. Of each fault the first few places are kept and the others are counted, so that
-/// a file that is wrong in every value takes no more memory than one that is right.
+/// The findings of a file. For each fault, the first few places are kept and the rest only counted, so a file
+/// with faults everywhere takes no more memory than a correct one.
 class CFindings
 {
 public:
-    /// A fault that a mended copy is free of where the table of faults says so.
+    /// Adds a fault, which a repaired copy fixes if the fault table says so.
     void Add(EFault fault, size_t line, std::string name = {});
-    /// A fault that stays in a mended copy.
+    /// Adds a fault that remains in a repaired copy.
     void AddUnmended(EFault fault, size_t line, std::string name = {});
-    /// What a reader failed on or warned of.
+    /// Adds a failure or warning of a reader.
     void AddReader(const CFailure& failure, ESeverity severity);
 
-    /// All findings by line; those of the file as a whole first.
+    /// Returns all findings by line; those about the whole file first.
     std::vector<Finding> Sorted() const;
     bool Has(EFault fault) const;
     bool HasErrors() const;
-    /// Whether there is an error or a warning.
+    /// Returns whether there is an error or a warning.
     bool HasFaults() const;
-    /// Whether a mended copy is free of one error or warning at least.
+    /// Returns whether a repaired copy fixes at least one error or warning.
     bool MendsAny() const;
 
 private:

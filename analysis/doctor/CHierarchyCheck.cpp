@@ -1,3 +1,7 @@
+// Reads a BVH hierarchy tolerantly: it accepts misspelled keywords, braces in odd places and wrong channel
+// counts, reports each as a finding, and records the edit that repairs it. The strict reader is the
+// reference: whatever it would misread must become a finding here.
+
 #include "CHierarchyCheck.h"
 
 #include "CFindings.h"
@@ -48,7 +52,7 @@ const CHierarchyCheck::KeywordRow CHierarchyCheck::kKeywords[] = {
 
 bool CHierarchyCheck::Read(BVHOutline& outline)
 {
-    // The reader refuses more joints than it has room for; until then they stay in proportion to the file.
+    // The reader refuses more joints than its limit; up to there, their number is proportional to the file.
     while (!m_bMotion && m_kJoints.size() <= kBoneLimit && lines_.Next())
         ReadLine();
     PartLines();
@@ -57,7 +61,7 @@ bool CHierarchyCheck::Read(BVHOutline& outline)
     return m_bMotion;
 }
 
-// A brace counts alone on its line; words that share one are put on lines of their own.
+// A brace only counts on a line of its own; shared lines are split.
 void CHierarchyCheck::ReadLine()
 {
     std::string_view rest = lines_.Line();
@@ -70,7 +74,7 @@ void CHierarchyCheck::ReadLine()
     }
 }
 
-// Only where all blocks are closed after that: else the braces are not what they seem.
+// Only if all blocks are closed afterwards; otherwise the braces are not what they seem.
 void CHierarchyCheck::PartLines()
 {
     const bool closed = m_bBracesFit && m_kOpen.empty();
@@ -88,7 +92,7 @@ void CHierarchyCheck::PartLines()
     }
 }
 
-// Whatever stands before the hierarchy is nobody's business.
+// Text before the hierarchy is ignored.
 void CHierarchyCheck::ReadWords(std::string_view words)
 {
     std::string_view rest = words;
@@ -119,7 +123,7 @@ void CHierarchyCheck::OpenRoot(std::string_view name)
     Add(name, OutlineJoint::kNoParent);
 }
 
-// A joint outside all blocks belongs to the root; one in a block that is not read is not read either.
+// A joint outside all blocks belongs to the root; one in a skipped block is skipped too.
 void CHierarchyCheck::OpenJoint(std::string_view name)
 {
     const size_t parent = m_kOpen.empty() ? 0 : m_kOpen.back().joint;
@@ -138,7 +142,7 @@ void CHierarchyCheck::Add(std::string_view name, size_t parent)
     m_kJoints.push_back(std::move(joint));
 }
 
-// Words up to a remark are a name that was meant as one.
+// All words up to a comment are treated as the name.
 std::string CHierarchyCheck::ReadName(std::string_view name)
 {
     const std::string_view first = NextToken(name);
@@ -203,8 +207,8 @@ void CHierarchyCheck::ReadOffset(std::string_view numbers)
     }
 }
 
-// Channels beyond the count are meant as such: whoever wrote the rows wrote a value for them. Other words
-// there are a remark.
+// Channels beyond the count are assumed to be meant, because the rows contain a value for them. Other words
+// are comments.
 void CHierarchyCheck::ReadChannels(std::string_view rest)
 {
     const auto count = static_cast<size_t>(std::max(ParseInt(NextToken(rest)), 0));
@@ -231,7 +235,7 @@ void CHierarchyCheck::CheckChannel(std::string_view word, int channel)
         CheckSpelling(word, kChannelNames[channel]);
 }
 
-// The root takes a value also where it has no channels.
+// The root takes a value even without channels.
 void CHierarchyCheck::PlanColumns(BVHOutline& outline)
 {
     for (OutlineJoint& joint : m_kJoints)

@@ -13,8 +13,8 @@ namespace gw {
 class CFindings;
 class CTextEdits;
 
-/// Reads the hierarchy of a BVH text as a person would: what the strict reader refuses is understood where it
-/// can be, told as a finding, and mended by an edit of the text.
+/// Reads the hierarchy of a BVH text as a person would: anything the strict reader refuses is understood if
+/// possible, reported as a finding, and repaired by an edit of the text.
 class CHierarchyCheck
 {
 public:
@@ -23,20 +23,21 @@ public:
     {
     }
 
-    /// Fills the outline's joints and leaves the cursor on the line "MOTION". False where that never comes.
+    /// Fills the outline's joints and leaves the cursor on the line "MOTION". Returns false if that line is
+    /// missing.
     bool Read(BVHOutline& outline);
 
 private:
     struct KeywordRow;
     struct Block
     {
-        size_t joint; // kNoParent where it makes none
+        size_t joint; // kNoParent if it creates no joint
         bool braced = false;
     };
     struct SharedLine
     {
         size_t line;
-        size_t offset; // of the words that want a line of their own
+        size_t offset; // of the words that need their own line
     };
     static const KeywordRow kKeywords[];
 

@@ -11,13 +11,13 @@ namespace gw {
 class CLineCursor
 {
 public:
-    /// Begins at a byte of a text, on the line of that number.
+    /// Starts at a byte of a text, which is on this line.
     explicit CLineCursor(std::string_view text, size_t begin = 0, size_t line = 1)
         : m_kText(text), m_kRest(text.substr(begin)), m_uiNext(line)
     {
     }
 
-    /// Goes on to the next line. False when the text is used up.
+    /// Moves to the next line. False at the end of the text.
     bool Next()
     {
         if (!NextLine(m_kRest, m_kLine))
@@ -25,14 +25,14 @@ public:
         m_uiLine = m_uiNext++;
         return true;
     }
-    /// The line at the cursor without its end, and its number.
+    /// Returns the current line without its end, and its number.
     std::string_view Line() const { return m_kLine; }
     size_t Number() const { return m_uiLine; }
     bool IsBlank() const { return m_kLine.find_first_not_of(kTokenDelimiters) == m_kLine.npos; }
 
-    /// Where a part of the text begins in it.
+    /// Returns where a part of the text starts.
     size_t OffsetOf(std::string_view part) const { return static_cast<size_t>(part.data() - m_kText.data()); }
-    /// Where the line behind the cursor begins.
+    /// Returns where the next line starts.
     size_t NextOffset() const { return m_kText.size() - m_kRest.size(); }
     size_t NextNumber() const { return m_uiNext; }
 

@@ -14,10 +14,10 @@ namespace gw {
 
 namespace {
 
-constexpr double kLongestFrame = 10.0; // seconds; from here on it is a rate
+constexpr double kLongestFrame = 10.0; // seconds; a larger value is a rate
 
-// Takes the letters of a keyword off a text, in any case, with any blanks between them, with its colon or
-// without. False where others stand there.
+// Removes a keyword from the front of a text, in any case, with any blanks between its letters, with or
+// without a colon. False if the text starts differently.
 bool TakeKeyword(std::string_view keyword, std::string_view& text)
 {
     std::string_view rest = text;
@@ -35,7 +35,7 @@ bool TakeKeyword(std::string_view keyword, std::string_view& text)
     return true;
 }
 
-// Whether the strict reader sees the keyword at the front of a line, with a value behind it.
+// Returns whether the strict reader recognizes the keyword at the front of a line, followed by a value.
 bool IsSpelled(std::string_view keyword, std::string_view line)
 {
     for (std::string_view word = NextToken(keyword); !word.empty(); word = NextToken(keyword))
@@ -70,7 +70,7 @@ bool CMotionHeadCheck::SkipEmptyLines()
     return false;
 }
 
-// What stands behind a keyword on the next line.
+// Reads the text after a keyword on the next line.
 bool CMotionHeadCheck::NextValue(std::string_view keyword, std::string_view& value)
 {
     if (!SkipEmptyLines())

@@ -10,7 +10,7 @@ namespace gw {
 class CFindings;
 class CTextEdits;
 
-/// Reads the two lines between "MOTION" and the rows, as CHierarchyCheck reads what comes before.
+/// Checks the two lines between "MOTION" and the rows, as CHierarchyCheck does for the lines before.
 class CMotionHeadCheck
 {
 public:
@@ -19,7 +19,7 @@ public:
     {
     }
 
-    /// Fills the outline's head of the motion and leaves the cursor before the rows. False where the lines
+    /// Fills the outline's motion fields and leaves the cursor before the rows. Returns false if the lines
     /// cannot be understood.
     bool Read(BVHOutline& outline);
 

@@ -1,3 +1,8 @@
+// Checks motion rows. A row is compared with the column count of the hierarchy; whether a short row is the
+// truncated end of the file or a fault in the middle is known only when the next row arrives, so findings are
+// delayed by one row. Missing numbers are interpolated if the gap is short; anything longer is reported but
+// not invented.
+
 #include "CRowCheck.h"
 
 #include "CFindings.h"
@@ -16,7 +21,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kLongestGap = 3; // frames without a number that may be made up from those beside them
+constexpr size_t kLongestGap = 3; // frames without a number that can be interpolated
 
 bool IsSeparator(char c)
 {
@@ -46,7 +51,7 @@ void CRowCheck::Read(CLineCursor& lines)
     MendCells();
 }
 
-// Behind the last frame that is promised, what is no whole row is no row at all.
+// After the last promised frame, an incomplete row is not counted as a row.
 bool CRowCheck::IsPastRows(std::string_view line) const
 {
     if (outline_.frameCount > 0 && m_uiRows < static_cast<size_t>(outline_.frameCount))
@@ -64,7 +69,7 @@ void CRowCheck::TellEmptyLines()
     m_uiEmptyLines = 0;
 }
 
-// The last one may be left out; in any other place the frames behind it would come early.
+// The last row can be left out; leaving out any other would move the following frames forward.
 void CRowCheck::TellShortRow(bool isLast)
 {
     if (m_uiShortLine == 0)
@@ -97,7 +102,7 @@ void CRowCheck::ReadRow(std::string_view row, size_t line)
         m_uiShortLine = line;
 }
 
-// As many values as there are columns; answers how many there are in the text.
+// Reads as many values as there are columns and returns the number of values in the text.
 size_t CRowCheck::ReadValues(std::string_view row)
 {
     m_kRow.clear();
@@ -131,7 +136,7 @@ void CRowCheck::JudgeToken(std::string_view token, size_t column)
         m_kRow[column] = std::nanf("");
 }
 
-// A NaN in a row that is whole waits for the rows behind it.
+// A NaN in a complete row is reported once the following rows are known.
 void CRowCheck::TellBadTokens(bool whole, size_t line)
 {
     const auto row = static_cast<uint32_t>(m_kTable.RowCount());
@@ -176,8 +181,8 @@ void CRowCheck::MendCells()
     }
 }
 
-// The value between those of the nearest frames that have one; at the beginning and the end the only one.
-// False, with a NaN, where the gap is too long for that.
+// Computes a value between those of the nearest frames that have one; at the start and end, the only one.
+// Returns false, with a NaN, if the gap is too long.
 bool CRowCheck::MeanOfNeighbours(const BadCell& cell, float& value) const
 {
     size_t before = cell.row;

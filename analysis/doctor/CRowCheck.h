@@ -15,23 +15,23 @@ namespace gw {
 
 class CFindings;
 
-/// What a mended copy does with the rows, beside the values that it gives anew.
+/// What a repaired copy does with the rows, apart from the changed values.
 struct RowPlan
 {
     size_t rowCount = 0;            ///< rows of the copy, which are the first ones of the text
-    bool dropsLast = false;         ///< the row behind them is left out
-    bool correctsCount = false;     ///< the number of frames becomes rowCount
-    std::vector<float> subtrahends; ///< for each column, what is taken off its values; empty for nothing
+    bool dropsLast = false;         ///< leaves out the row after them
+    bool correctsCount = false;     ///< sets the frame count to rowCount
+    std::vector<float> subtrahends; ///< per column, the number to subtract from its values; empty if unused
 };
 
-/// Reads the rows of a BVH text: finds those that are short, long, missing, too many or of no numbers, and
-/// mends single values by their neighbours.
+/// Checks the rows of a BVH text: finds rows that are short, long, missing, in excess or not numeric, and
+/// repairs single values from their neighbors.
 class CRowCheck
 {
 public:
     CRowCheck(const BVHOutline& outline, CFindings& findings) : outline_(outline), findings_(findings) {}
 
-    /// Reads from the cursor on.
+    /// Reads from the cursor to the end.
     void Read(CLineCursor& lines);
 
     CRowTable& Table() { return m_kTable; }
@@ -67,11 +67,11 @@ private:
     CRowTable m_kTable;
     RowPlan m_kPlan;
     std::vector<float> m_kRow;
-    std::vector<BadToken> m_kBadTokens; // of the row at hand
-    std::vector<BadCell> m_kBadCells;   // of all rows that are whole
-    size_t m_uiFirstEmptyLine = 0;      // of those that are not told yet: whether rows follow is not known
+    std::vector<BadToken> m_kBadTokens; // of the current row
+    std::vector<BadCell> m_kBadCells;   // of all complete rows
+    size_t m_uiFirstEmptyLine = 0;      // of those not yet reported, since it is unknown whether rows follow
     size_t m_uiEmptyLines = 0;
-    size_t m_uiShortLine = 0; // of the row before, where it was short; 0 where it was not
+    size_t m_uiShortLine = 0; // line of the previous row if that was short, otherwise 0
     size_t m_uiRows = 0;      // of all kinds
 };
 

@@ -75,7 +75,7 @@ void CRowMender::AppendValues(std::string_view row)
     for (size_t column = 0; column < outline_.columnCount; ++column)
     {
         const std::string_view token = NextToken(rest);
-        m_kOut.append(at, token.data()); // the blanks as they are
+        m_kOut.append(at, token.data()); // the original blanks
         AppendValue(token, column);
         at = token.data() + token.size();
     }
@@ -87,7 +87,7 @@ void CRowMender::AppendValue(std::string_view token, size_t column)
     const float less = plan_.subtrahends.empty() ? 0.0f : plan_.subtrahends[column];
     const bool mended = IsCellOf(column);
     double value = ParseDouble(token);
-    while (IsCellOf(column)) // mended twice, the later value counts
+    while (IsCellOf(column)) // the later of two repairs counts
         value = static_cast<double>(m_kCells[m_uiNextCell++].value);
     if (mended || (less != 0.0f && !FaultOfNumber(token)))
         AppendFixed6(m_kOut, static_cast<float>(value - static_cast<double>(less)));

@@ -15,8 +15,8 @@ class CLineCursor;
 class CSafeFile;
 struct BVHOutline;
 
-/// Writes the rows of a motion again as a plan of the check wants them. A value that nobody changes stays as
-/// it is written, and so do line ends and what stands behind the rows.
+/// Writes the rows of a motion according to a repair plan. Unchanged values keep their spelling, and so do
+/// line ends and the text after the rows.
 class CRowMender
 {
 public:
@@ -25,7 +25,7 @@ public:
     {
     }
 
-    /// Writes from the beginning of the rows to the end of the text. False when the file takes it not.
+    /// Writes from the first row to the end of the text. Returns false if the file cannot be written.
     bool Write(std::string_view text, CSafeFile& file);
 
 private:
@@ -38,9 +38,9 @@ private:
 
     const BVHOutline& outline_;
     const RowPlan& plan_;
-    std::vector<MendedCell> m_kCells; // in the order of the rows
+    std::vector<MendedCell> m_kCells; // in row order
     size_t m_uiNextCell = 0;
-    size_t m_uiWhole = 0; // rows so far that are whole, as the cells count them
+    size_t m_uiWhole = 0; // complete rows so far, as the cells count them
     std::string m_kOut;
 };
 

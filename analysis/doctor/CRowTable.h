@@ -7,7 +7,7 @@
 
 namespace gw {
 
-/// One value of the rows that is given anew in a mended copy.
+/// A value that a repaired copy changes.
 struct MendedCell
 {
     uint32_t row;
@@ -15,14 +15,14 @@ struct MendedCell
     float value;
 };
 
-/// The values of a motion's rows, as far as rows are whole; a value that is no number is a NaN here until it
-/// is mended. Kept column by column, since a joint is looked at over all frames.
+/// The values of a motion's complete rows. A value that is not a number is NaN until it is repaired. Stored
+/// by column, because a joint is examined over all frames.
 class CRowTable
 {
 public:
     explicit CRowTable(size_t columnCount = 0) : m_kColumns(columnCount) {}
 
-    /// Adds a row of so many values as there are columns, with its line in the text.
+    /// Adds a row with one value per column, and its line in the text.
     void Append(std::span<const float> values, size_t line);
 
     size_t ColumnCount() const { return m_kColumns.size(); }
@@ -31,14 +31,14 @@ public:
     float At(size_t row, size_t column) const { return m_kColumns[column][row]; }
     std::span<const float> Column(size_t column) const { return m_kColumns[column]; }
 
-    /// Gives a value anew, here and in a mended copy.
+    /// Changes a value, here and in a repaired copy.
     void Mend(size_t row, size_t column, float value);
-    /// All values given anew, in the order of the rows.
+    /// Returns all changed values, in row order.
     std::vector<MendedCell> TakeMended();
 
 private:
     std::vector<std::vector<float>> m_kColumns;
-    std::vector<uint32_t> m_kLines; // a text of more lines does not fit into memory
+    std::vector<uint32_t> m_kLines; // a text with more lines does not fit into memory
     std::vector<MendedCell> m_kMended;
 };
 

@@ -9,18 +9,18 @@ namespace gw {
 
 class CSafeFile;
 
-/// Replacements in a text, which itself stays as it is. They may come in any order and must not
-/// overlap; of two at one place the one that came first is done first. Beyond kMost of them no more are
-/// taken: such a text is no motion, and mending it must not take more memory than it is worth.
+/// Replacements in a text, which itself is not changed. They can be added in any order but must not overlap;
+/// of two at one place, the first one is applied first. Edits beyond kMost are ignored: such a text is not a
+/// motion, and repairing it must not take much memory.
 class CTextEdits
 {
 public:
     static constexpr size_t kMost = size_t{1} << 19;
 
-    /// Puts `instead` in the place of `length` bytes from `begin` on.
+    /// Replaces `length` bytes starting at `begin` by `instead`.
     void Replace(size_t begin, size_t length, std::string_view instead);
 
-    /// Writes the text as it is with all edits done. False when the file takes it not.
+    /// Writes the text with all edits applied. Returns false if the file cannot be written.
     bool Write(std::string_view text, CSafeFile& file);
 
 private:
@@ -35,7 +35,7 @@ private:
     void Add(size_t begin, size_t length, std::string_view instead);
 
     std::vector<Edit> m_kEdits;
-    std::string m_kInstead; // the new texts, one behind the other
+    std::string m_kInstead; // all replacement texts, concatenated
 };
 
 } // namespace gw

@@ -23,7 +23,7 @@ void LookForSameNames(const BVHOutline& outline, CFindings& findings)
     }
 }
 
-// Nothing for a joint of which not all channels are known.
+// Returns nothing for a joint with an unknown channel.
 std::vector<int> RotationOrder(const OutlineJoint& joint)
 {
     if (std::ranges::count(joint.channels, OutlineJoint::kNoChannel) > 0)
@@ -33,7 +33,7 @@ std::vector<int> RotationOrder(const OutlineJoint& joint)
     return order;
 }
 
-// Root and other joints may differ in positions; only the order of rotations is told.
+// The root's positions may differ from other joints'; only rotation orders are reported.
 void LookForMixedChannels(const BVHOutline& outline, CFindings& findings)
 {
     std::vector<int> usual;

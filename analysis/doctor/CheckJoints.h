@@ -5,7 +5,7 @@ namespace gw {
 class CFindings;
 struct BVHOutline;
 
-/// Finds joints of one name, and notes rotations that turn in different orders.
+/// Finds duplicate joint names, and reports mixed rotation orders.
 void CheckJoints(const BVHOutline& outline, CFindings& findings);
 
 } // namespace gw

@@ -1,6 +1,6 @@
-// Positions are added to the offsets. Programs that write positions on every joint mostly mean them to stand
-// in place of the offsets: every bone then comes out twice as long. The same happens to the hip alone where
-// its height at rest is the root's offset and its channels hold its place in the world.
+// Positions are added to the offsets. Programs that write positions on every joint mostly mean them to
+// replace the offsets: every bone then comes out twice as long. The same happens to the hip alone if its rest
+// height is the root's offset and its channels contain its position in the world.
 
 #include "CheckOffsets.h"
 
@@ -18,19 +18,19 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kProbeRows = 8;       // rows of which one may tell that positions repeat the offsets
+constexpr size_t kProbeRows = 8;       // rows that can show that positions repeat the offsets
 constexpr double kRepeatShare = 0.01;  // of an offset's length
-constexpr double kLeastHipShare = 0.5; // of the reach; a smaller offset is no height of a hip
-constexpr double kMostHipShare = 1.6;  // and a larger one is a place in a room
+constexpr double kLeastHipShare = 0.5; // of the reach; a smaller offset is not a hip height
+constexpr double kMostHipShare = 1.6;  // and a larger one is a position in a room
 constexpr double kHipMotionShare =
-    0.25; // of the reach: the hip stays so near to its height, most of the time
+    0.25; // of the reach: the hip stays this close to its height most of the time
 
 double FiniteOr0(double number)
 {
     return std::isfinite(number) ? number : 0.0;
 }
 
-// What the rows have of one joint's positions.
+// The position values of one joint in all rows.
 class CPositions
 {
 public:
@@ -46,7 +46,7 @@ public:
     {
         return Vec3Length(At(row) - joint_.offset) <= kRepeatShare * Vec3Length(joint_.offset);
     }
-    // Whether they stay nearer to the offset than to its lack.
+    // Returns whether they are closer to the offset than to zero.
     bool StandForOffset() const
     {
         double toOffset = 0.0;
@@ -58,7 +58,7 @@ public:
         }
         return toOffset < toZero;
     }
-    // From the offset, along one axis.
+    // Returns the distance from the offset along one axis.
     double MeanDistance(size_t axis) const
     {
         double sum = 0.0;
@@ -101,7 +101,7 @@ private:
         findings_.Add(EFault::DoubledHipOffset, root.offsetLine, root.name);
         Subtract(root, positions);
     }
-    // Which way is up is not known here: some way the height must stand in both.
+    // The up axis is unknown here, so the height must be repeated along some axis of both.
     bool HoldsHeight(const OutlineJoint& root, const CPositions& positions) const
     {
         const double reach = SkeletonReach(outline_);
@@ -133,7 +133,7 @@ private:
     {
         return joint.parent != OutlineJoint::kNoParent && joint.offset != kVec3Zero && positions.AreThere();
     }
-    // The first joint that repeats its offset, where at least half of those that can do so.
+    // Returns the first joint that repeats its offset, if at least half of the joints that could do so do.
     const OutlineJoint* FirstRepeatingIn(size_t row) const
     {
         const OutlineJoint* first = nullptr;

@@ -19,7 +19,7 @@ namespace gw {
 namespace {
 
 constexpr double kLeastJumpShare = 0.1; // of the reach: 10 cm on a person
-constexpr float kMostTurn = 90.0f;      // degrees; angles further apart are two ways of saying one rotation
+constexpr float kMostTurn = 90.0f;      // degrees; angles further apart are two notations of one rotation
 
 class CSpikeCheck
 {
@@ -44,8 +44,8 @@ public:
     }
 
 private:
-    // No rotation turns by more than its angles do together, and angles are quickly compared. Joints without
-    // channels are free in a file, and so must not cost a walk through the rows each.
+    // A rotation is never larger than the sum of its angles, and angles are quick to compare. Joints without
+    // channels take no bytes in a file, so they must not cost a pass over the rows.
     bool MayJump(const std::vector<size_t>& columns) const
     {
         if (columns.empty())
@@ -84,8 +84,8 @@ private:
         }
     }
 
-    // Where the angles on both sides say about the same, the pose lies between them; else the one before
-    // stays for a frame.
+    // If the angles on both sides are similar, the pose is interpolated; otherwise the previous one is
+    // repeated for a frame.
     void Mend(const OutlineJoint& joint, size_t row, std::span<const size_t> columns)
     {
         const bool rotation = joint.channels[columns[0] - joint.firstColumn] >= 3;

@@ -1,5 +1,5 @@
-// Lines and words are looked at only after this, so that a blank that is none, or a line end of another
-// system, is one finding and not a hundred that follow from it.
+// Lines and words are examined only after this step, so that a false blank, or a line end of another system,
+// is one finding and not a hundred that follow from it.
 
 #include "CleanText.h"
 
@@ -14,12 +14,12 @@ namespace gw {
 
 namespace {
 
-// The beginning of every pointer file, without the address that follows.
+// The start of every pointer file, without the address.
 constexpr std::string_view kLfsBeginning = "version https://git-lfs";
-constexpr size_t kStraysOfText = 8; // a text may hold so many beside one in kBytesPerStray
+constexpr size_t kStraysOfText = 8; // a text can contain this many, plus one per kBytesPerStray
 constexpr size_t kBytesPerStray = 64;
 
-// What other programs and people's editors leave in a text, and what it was meant for.
+// Characters that programs and text editors leave behind, and what was meant.
 struct StrayRow
 {
     std::string_view what;
@@ -43,7 +43,7 @@ bool IsControl(char c)
     return (code < 0x20 && c != '\t' && c != '\n' && c != '\r') || code == 0x7f;
 }
 
-// The bytes at which something may be wrong, so that all others take one look.
+// Marks the bytes that may be wrong, so that all others cost one look-up.
 constexpr auto kIsSuspect = [] {
     std::array<bool, 256> suspect{};
     for (size_t code = 0; code < 0x20; ++code)
@@ -107,8 +107,8 @@ private:
             return Keep(1);
         Replace(EFault::StrayCharacter, stray->bytes.size(), stray->instead, stray->what);
     }
-    // Where no line feed is in the whole text, lines end so. Else it is a blank at best, and before a whole
-    // line end it came from changing line ends twice.
+    // If the whole text has no line feed, these are its line ends. Otherwise a return is a blank at best, and
+    // before a complete line end it comes from converting line ends twice.
     void JudgeReturn()
     {
         if (m_kRest.starts_with("\r\n"))

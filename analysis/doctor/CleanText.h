@@ -7,13 +7,12 @@ namespace gw {
 
 class CFindings;
 
-/// Whether a file is a pointer of Git LFS, which stands where the file itself was not fetched.
+/// Returns whether a file is a Git LFS pointer, present because the actual file was not fetched.
 bool IsLfsPointer(std::string_view text);
 
-/// The text of a motion file without what belongs into none: byte order mark, control characters, blanks and
-/// signs of typesetting, carriage returns without a line feed. Each is a
-/// finding. Answers the text itself where it is clean, else `clean`, which then holds it. Where the bytes are
-/// no text at all the answer is empty.
+/// Removes everything that is not allowed in a motion file: byte order mark, control characters, typographic
+/// blanks and signs, carriage returns without a line feed. Each is a finding. Returns the text itself if it
+/// is clean, otherwise `clean`, which receives the result; empty if the bytes are not text at all.
 std::string_view CleanText(std::string_view text, std::string& clean, CFindings& findings);
 
 } // namespace gw

@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// Rows are calls, which the formatter leaves as they are read.
+// Rows are function calls, because the formatter keeps their layout.
 constexpr FaultRow Mended(EFault fault, std::string_view code, ESeverity severity, std::string_view words,
                           std::string_view remedy)
 {

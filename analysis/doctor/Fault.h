@@ -6,19 +6,19 @@
 
 namespace gw {
 
-/// What can be wrong with a motion file, or worth knowing about it.
+/// A fault of a motion file, or something worth knowing about it.
 enum class EFault : uint8_t
 {
-    Reader, ///< what the format's own reader failed on or warned of; it has words of its own
+    Reader, ///< the reader's own failure or warning, which has its own message
 
-    // Of the bytes.
+    // In the bytes.
     LfsPointer,
     NotText,
     ByteOrderMark,
     CarriageReturn,
     StrayCharacter,
 
-    // Of the hierarchy.
+    // In the hierarchy.
     KeywordSpelling,
     BraceOnLine,
     BlankInName,
@@ -27,7 +27,7 @@ enum class EFault : uint8_t
     UnknownChannel,
     SecondRoot,
 
-    // Of the motion's head and its rows.
+    // In the motion's head and rows.
     EmptyLineBeforeFrames,
     EmptyLineInRows,
     DecimalComma,
@@ -40,7 +40,7 @@ enum class EFault : uint8_t
     NaN,
     StuckNumber,
 
-    // Of the poses.
+    // In the poses.
     DoubledOffset,
     DoubledHipOffset,
     Spike,
@@ -52,26 +52,26 @@ enum class EFault : uint8_t
 
 enum class ESeverity : uint8_t
 {
-    Error,   ///< refused, or read as something else than was meant
-    Warning, ///< read, but a conversion will show it
-    Note,    ///< legal and in order, but good to know
+    Error,   ///< refused, or read differently than intended
+    Warning, ///< read, but visible in a conversion
+    Note,    ///< valid, but good to know
 };
 
-/// What is known of a fault beforehand.
+/// The fixed properties of a fault.
 struct FaultRow
 {
     EFault fault;
-    std::string_view code; ///< a short word that stays as it is, for programs
+    std::string_view code; ///< a short word for programs, which never changes
     ESeverity severity;
-    bool mends; ///< a mended copy can be free of it
+    bool mends; ///< a repaired copy can fix it
     std::string_view words;
     std::string_view remedy;
 };
 
-/// All faults, in the order of EFault.
+/// Returns all faults, in EFault order.
 std::span<const FaultRow> FaultTable();
 const FaultRow& RowOf(EFault fault);
-/// "error", "warning" or "note".
+/// Returns "error", "warning" or "note".
 std::string_view SeverityName(ESeverity severity);
 
 } // namespace gw

@@ -1,8 +1,8 @@
-// A marker that is mistaken for another one throws a joint out of its motion for a frame or two and lets it
-// come back to where it would have been. No body does that: a fast one that turns round is on its way before
-// and after. So three things must come together: the step out and the step back are large, the steps around
-// are small against both, and the frames on both sides fit to each other: they are apart by what the motion
-// around does in that time, or by little.
+// A marker that is mistaken for another one throws a joint out of its motion for a frame or two, then the
+// joint returns to where it would have been. No body moves like that: even a fast one that reverses is on its
+// way before and after. So three conditions must hold: the step out and the step back are large, the steps
+// around them are small compared to both, and the frames on both sides match: their distance is small, or
+// what the surrounding motion covers in that time.
 
 #include "FindSpikes.h"
 
@@ -16,11 +16,11 @@ namespace gw {
 namespace {
 
 constexpr size_t kLongestSpike = 2;
-constexpr size_t kWindow = 4;        // steps on each side that tell the motion around
-constexpr size_t kLeastAround = 3;   // of them must be there for a verdict
-constexpr double kMostAcross = 0.25; // from before to behind, as a share of the jump
-constexpr double kMostHaste = 1.5;   // or by the steps around
-constexpr double kMostAround = 0.2;  // the largest step around, as a share of the jump
+constexpr size_t kWindow = 4;        // steps on each side that show the surrounding motion
+constexpr size_t kLeastAround = 3;   // at least this many are needed for a verdict
+constexpr double kMostAcross = 0.25; // distance from before to after, as a share of the jump
+constexpr double kMostHaste = 1.5;   // or relative to the surrounding steps
+constexpr double kMostAround = 0.2;  // the largest surrounding step, as a share of the jump
 
 double StepBetween(const Quat& a, const Quat& b)
 {
@@ -81,7 +81,8 @@ private:
         const double across = StepBetween(m_kKeys[first - 1], m_kKeys[behind]);
         return across <= std::max(kMostAcross * jump, kMostHaste * around * static_cast<double>(count + 1));
     }
-    // Of the steps before the one out and behind the one back; below 0 where there are too few for a verdict.
+    // Considers the steps before the step out and after the step back; negative if there are too few for a
+    // verdict.
     double LargestStepAround(size_t out, size_t back) const
     {
         const size_t begin = out - std::min(out, kWindow);

@@ -9,19 +9,20 @@
 
 namespace gw {
 
-/// Frames in which a joint has jumped out of its motion; the frame behind them is back in it.
+/// Frames in which a joint has jumped out of its motion; it is back in the frame after them.
 struct Spike
 {
     size_t first; ///< frame
     size_t count; ///< 1 or 2
 };
 
-/// The least turn of a spike: twice what a fast limb turns in a frame of a usual rate.
+/// The minimum rotation of a spike: twice what a fast limb rotates per frame at usual rates.
 inline constexpr double kLeastSpikeDegrees = 30.0;
 
-/// Spikes of a joint's rotations: at least kLeastSpikeDegrees out and back, and far beyond the motion around.
+/// Returns spikes in a joint's rotations: at least kLeastSpikeDegrees out and back, and far beyond the
+/// surrounding motion.
 std::vector<Spike> FindSpikes(std::span<const Quat> rotations);
-/// Spikes of a joint's positions that go at least `least` out, in their unit.
+/// Returns spikes in a joint's positions of at least `least`, in their unit.
 std::vector<Spike> FindSpikes(std::span<const Vec3> positions, double least);
 
 } // namespace gw

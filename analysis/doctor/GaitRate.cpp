@@ -1,10 +1,10 @@
-// A wrong frame rate cannot be seen in a pose, only in time, and time is what is in doubt. People's steps
-// tell it: from a slow walk to a run the ratio of step length to step frequency stays about the same (the
-// "walk ratio", 0.0065 m per step a minute on adults). So the length of the steps, which needs no clock,
-// tells how many of them go into a minute, and that, against the frames of a step, tells the rate.
+// A wrong frame rate cannot be seen in a pose, only in time, and time is what is in doubt. Steps reveal it:
+// from a slow walk to a run, the ratio of step length to step frequency is about constant (the "walk ratio",
+// 0.0065 m per step per minute for adults). So the step length, which needs no clock, predicts the steps per
+// minute, and comparing that with the frames per step gives the rate.
 //
-// Steps are found without a clock, a heading or a floor: the distance of the feet over the ground is largest
-// once a step.
+// Steps are found without a clock, a heading or a floor: the distance between the feet over the ground has
+// one maximum per step.
 
 #include "GaitRate.h"
 
@@ -19,22 +19,24 @@ namespace gw {
 
 namespace {
 
-constexpr double kWalkRatio = 0.0065; // metres, for a step a minute
+constexpr double kWalkRatio = 0.0065; // meters, for a step per minute
 constexpr double kLegMetres = 0.82;   // thigh and shin of an adult
-constexpr double kSlowest = 70.0;     // steps a minute: a stroll
+constexpr double kSlowest = 70.0;     // steps per minute: a stroll
 constexpr double kFastest = 220.0;    // a sprint
-constexpr double kMostApart = 2.0;    // rates that differ by this factor are not one rate
+constexpr double kMostApart = 2.0;    // rates that differ by this factor are different rates
 
 constexpr size_t kLeastSteps = 4;
 constexpr double kLeastSpread =
-    0.3;                            // of the leg: how much further feet are apart in a step than side by side
-constexpr double kLeastStep = 0.35; // of the leg: shorter ones are a dance or a turn
-constexpr double kMostStep = 2.2;   // longer ones are jumps
-constexpr double kMostVariation = 0.25; // standard deviation by mean, of durations and of lengths
-constexpr double kStandingShare = 0.4;  // the standing foot moves at most so much of what the other one does
-constexpr double kLeastStandShare = 0.75; // of the steps in which one does
+    // of the leg: how much further apart the feet are in a step than side by side
+    0.3;
+constexpr double kLeastStep = 0.35;     // of the leg: shorter ones are a dance or a turn
+constexpr double kMostStep = 2.2;       // longer ones are jumps
+constexpr double kMostVariation = 0.25; // standard deviation by mean, of durations and lengths
+// the standing foot moves at most this share of the other foot's movement
+constexpr double kStandingShare = 0.4;
+constexpr double kLeastStandShare = 0.75; // of the steps in which one foot stands
 
-// Mean, and standard deviation as a share of it.
+// Mean, and standard deviation relative to it.
 struct Spread
 {
     explicit Spread(std::span<const double> values)
@@ -96,7 +98,7 @@ private:
         std::ranges::nth_element(sorted, nth);
         return *nth;
     }
-    // A step is where the feet come apart: over the upper line after they were below the lower one.
+    // A step is where the feet move apart: above the upper line after having been below the lower one.
     void FindSteps()
     {
         if (m_kApart.empty())
@@ -115,7 +117,7 @@ private:
             armed = false;
         }
     }
-    // While the feet pass each other, half a step before they are furthest apart, one of them stands.
+    // While the feet pass each other, half a step before they are furthest apart, one of them stands still.
     bool FeetTakeTurns() const
     {
         size_t stands = 0;
@@ -139,8 +141,8 @@ private:
     const BodyPaths& paths_;
     Vec3 m_kUp;
     double m_fLeg;
-    std::vector<double> m_kApart; // the feet, over the ground
-    std::vector<size_t> m_kSteps; // frames in which they come apart
+    std::vector<double> m_kApart; // distance between the feet over the ground
+    std::vector<size_t> m_kSteps; // frames in which they move apart
 };
 
 } // namespace

@@ -12,13 +12,13 @@ namespace gw {
 class CRowTable;
 struct OutlineJoint;
 
-/// The columns of a joint's X, Y and Z position in a row. False for a joint that lacks one of them.
+/// Stores the columns of a joint's X, Y and Z position. Returns false if the joint lacks one of them.
 bool PositionColumns(const OutlineJoint& joint, std::array<size_t, 3>& columns);
-/// What those columns hold in a row.
+/// Returns the values of those columns in a row.
 Vec3 PositionIn(const CRowTable& table, size_t row, const std::array<size_t, 3>& columns);
-/// The columns of a joint's rotations.
+/// Returns the columns of a joint's rotations.
 std::vector<size_t> RotationColumns(const OutlineJoint& joint);
-/// The joint's rotation in each row.
+/// Returns the joint's rotation in each row.
 std::vector<Quat> RotationsOf(const OutlineJoint& joint, const CRowTable& table);
 
 } // namespace gw

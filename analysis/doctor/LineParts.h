@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// Takes the next part off a line of a hierarchy, without blanks around it: a brace, or the words up to a
-/// brace that has nothing, another brace or a keyword behind it. Empty when none is left.
+/// Removes and returns the next part of a hierarchy line, trimmed: a brace, or the words up to a brace that
+/// is followed by nothing, another brace or a keyword. Empty at the end.
 std::string_view NextPart(std::string_view& rest);
 
 } // namespace gw

@@ -10,14 +10,14 @@ namespace {
 struct UnitRow
 {
     std::string_view name;
-    double shortest; // leg, of a child
-    double longest;  // of a tall adult
+    double shortest; // leg of a child
+    double longest;  // leg of a tall adult
 };
 
 constexpr UnitRow kUnits[] = {
     {"metres",          0.4,   1.1   },
     {"decimetres",      5.0,   11.0  },
-    {"units of 5.6 cm", 12.0,  18.0  }, // of a large university's archive
+    {"units of 5.6 cm", 12.0,  18.0  }, // used in a large university's archive
     {"inches",          20.0,  42.0  },
     {"centimetres",     45.0,  110.0 },
     {"millimetres",     450.0, 1100.0},

@@ -18,22 +18,22 @@ enum class EBodySource : uint8_t
     Shape,
 };
 
-/// What a user wants to know of a motion that is in order.
+/// Facts about a valid motion that a user wants to know.
 struct MotionFacts
 {
     size_t jointCount = 0;
     size_t frameCount = 0;
     double frameSeconds = 0.0;
-    double leg = 0.0;      ///< thigh and shin in units of the file; 0 where they are not known
-    std::string_view unit; ///< what the leg's length makes of the unit; empty where it fits none
-    std::string_view up;   ///< "Y" or "-Z"; empty where the hip and the feet are not known
+    double leg = 0.0;      ///< thigh and shin in file units; 0 if unknown
+    std::string_view unit; ///< the unit suggested by the leg's length; empty if none fits
+    std::string_view up;   ///< "Y" or "-Z"; empty if hip or feet are unknown
     ERestPose restPose = ERestPose::Unknown;
     EBodySource body = EBodySource::None;
 };
 
-/// The unit in which a leg of an adult or of a child has that length, or empty.
+/// Returns the unit in which an adult's or a child's leg has this length, or empty.
 std::string_view UnitOfLeg(double leg);
-/// "names", "shape" or "none".
+/// Returns "names", "shape" or "none".
 std::string_view BodySourceName(EBodySource source);
 
 } // namespace gw

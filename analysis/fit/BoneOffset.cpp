@@ -1,3 +1,8 @@
+// Converts a rotation to the numbers of a bone map row: axis codes (24 signed permutations) and three whole
+// degrees. The codes that leave the smallest angles are chosen first. Rounding to degrees loses up to half a
+// degree per axis, so all 27 neighbors of the rounded angles are compared, weighing the bone's direction far
+// more than its twist.
+
 #include "BoneOffset.h"
 
 #include "Angles.h"
@@ -15,10 +20,10 @@ namespace gw {
 
 namespace {
 
-// What a degree of turn about the bone counts against one of the bone's direction.
+// The weight of one degree of twist relative to one degree of direction.
 constexpr double kTwistWeight = 0.1;
 
-// All signed permutations that are rotations, the neutral one first.
+// Returns all signed permutations that are rotations, identity first.
 std::vector<AxisCodes> AxisRotations()
 {
     std::vector<AxisCodes> rotations;
@@ -45,7 +50,7 @@ std::vector<AxisCodes> AxisRotations()
 
 using Degrees = std::array<float, 3>;
 
-// The angles that are left for a rotation behind its axis codes.
+// Returns the remaining angles of a rotation after its axis codes.
 Degrees AnglesBehind(const AxisCodes& codes, const Mat3& rotation)
 {
     Degrees angles{};
@@ -61,7 +66,8 @@ float Size(const Degrees& angles)
     return std::fabs(angles[0]) + std::fabs(angles[1]) + std::fabs(angles[2]);
 }
 
-// How far the numbers are from a rotation, in degrees; `axis` counts for all, the other directions a little.
+// Returns the difference between the numbers and a rotation in degrees: `axis` counts fully, other directions
+// only a little.
 double Distance(const RowNumbers& numbers, const Mat3& rotation, const Vec3& axis)
 {
     const Mat3 offset = OffsetOf(numbers);

@@ -6,12 +6,12 @@
 
 namespace gw {
 
-/// The rotation that a row's numbers put before a source bone's.
+/// Returns the rotation that a row applies before the source bone's.
 Mat3 OffsetOf(const RowNumbers& numbers);
 
-/// A row's numbers for a rotation: axis codes that leave the least to turn, and whole degrees. Of all numbers
-/// near by those that best take `axis`, a direction of the target bone, to where the rotation takes it; what
-/// the degrees cannot hold goes into the turn about the bone.
+/// Returns a row's numbers for a rotation: the axis codes that leave the smallest angles, and whole degrees.
+/// Among nearby numbers, those that best reproduce the rotation of `axis`, a direction of the target bone;
+/// the rounding error goes into the twist about it.
 RowNumbers NearestOffset(const Mat3& rotation, const Vec3& axis);
 
 } // namespace gw

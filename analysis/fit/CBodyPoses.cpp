@@ -11,8 +11,8 @@ namespace gw {
 namespace {
 
 constexpr size_t kFrameCount = 6;
-// Degrees from straight down. Who stretches the arms over the head at rest was put there by the file's
-// frames.
+// In degrees from straight down. Arms stretched overhead in a rest pose come from a file's first frame, not
+// from modeling.
 constexpr double kArmsUp = 135.0;
 
 bool ShowsBody(const BodyStance& rest)

@@ -10,28 +10,28 @@
 
 namespace gw {
 
-/// Poses of a body in which it can be looked at: its rest pose where it stands in it, else some frames spread
-/// over its motion. Nodes that are posed on the way stand as they stood when the object goes.
+/// Poses in which a body can be judged: its rest pose if that is a standing pose, otherwise some frames
+/// spread over its motion. Nodes posed here are restored when the object is destroyed.
 class CBodyPoses
 {
 public:
-    /// The body has both upper arms and both thighs.
+    /// `body` must have both upper arms and both thighs.
     CBodyPoses(const CBodyMap& body, const BodyStance& rest);
     ~CBodyPoses();
     CBodyPoses(const CBodyPoses&) = delete;
     CBodyPoses& operator=(const CBodyPoses&) = delete;
 
-    /// Nodes that are looked at must be watched before the first pose is taken.
+    /// Watches a node. Call it for all nodes before the first pose.
     void Watch(CNode* node);
     size_t Count() const { return m_kFrames.empty() ? 1 : m_kFrames.size(); }
-    /// From 0 on.
+    /// Poses the tree; the first pose is 0.
     void Take(size_t pose);
 
-    // In the pose that was taken last.
-    /// Where a watched node stands; that of its bone mesh where it has one.
+    // In the current pose.
+    /// Returns the world matrix of a watched node, or of its bone mesh if it has one.
     Mat4 BoneWorld(const CNode& node) const;
     Vec3 Place(const CNode& node) const { return World(node).Translation(); }
-    /// The body's own axes as rows: to its left, up from the legs to the arms, forward.
+    /// Returns the body's own axes as rows: left, up from the legs to the arms, forward.
     Mat3 Axes() const;
 
 private:
@@ -47,7 +47,7 @@ private:
 
     const CBodyMap& body_;
     CPoseSampler m_kSampler;
-    std::vector<double> m_kFrames; // none for the rest pose
+    std::vector<double> m_kFrames; // empty for the rest pose
     std::vector<Kept> m_kKept;
 };
 

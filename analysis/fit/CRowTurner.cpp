@@ -1,8 +1,8 @@
-// A row's offset O stands left of the source bone's rotation S: the target bone's is O · S. So where the
-// source bone points in its own space, there O must take the direction of the target bone; any pose tells the
-// same. What is free is the turn about the bone. It is taken from a pose in which the source stands: there
-// the target stands in its own rest pose, turned to where the source looks, and each bone swings from there
-// to its direction the short way round.
+// A row's offset O is multiplied from the left to the source bone's rotation S: the target bone's rotation is
+// O · S. So O must take the target bone's direction to the source bone's direction in its own space, which
+// any pose shows. The twist about the bone remains free. It is chosen in a pose in which the source stands:
+// there the target is placed in its own rest pose, facing where the source faces, and each bone swings to its
+// direction by the smallest rotation.
 
 #include "CRowTurner.h"
 
@@ -17,19 +17,19 @@ namespace gw {
 
 namespace {
 
-// Which element is the sine depends on the bone's share type: 2 for arms as they come, 1 without a share file
-// and for all other bones.
+// Which matrix element is the sine depends on the bone's share type: 2 for arms in default maps, 1 without a
+// share file and for all other bones.
 bool IsSineOne(const Mat3& local, const HostRow& host)
 {
-    constexpr float kOne = 0.999998f; // a tenth of a degree away
+    constexpr float kOne = 0.999998f; // within a tenth of a degree
     const bool isArm = host.joint >= EBodyJoint::Clavicle && host.joint <= EBodyJoint::Hand;
     return std::fabs(local.m[3]) > kOne || (isArm && std::fabs(local.m[6]) > kOne);
 }
 
-// Whether the angles of a file give a rotation back.
+// Returns whether a file's Euler angles reproduce a rotation.
 bool IsGivenBack(const Mat3& rotation)
 {
-    constexpr float kSame = 0.9999f; // cosine, four fifths of a degree
+    constexpr float kSame = 0.9999f; // cosine of four fifths of a degree
     const Mat3 read = EulerToMat3("ZYX", Mat3ToEulerDegrees(rotation));
     return Vec3Dot(read.Row(0), rotation.Row(0)) > kSame && Vec3Dot(read.Row(1), rotation.Row(1)) > kSame;
 }
@@ -46,7 +46,7 @@ CRowTurner::CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const 
         if (joints_[row] != CJointTree::kNone && kHostRows[row].aim != EHostAim::None)
             Turn(row);
     }
-    // A bone that is turned may itself come to hang at a pole, so the bones above follow.
+    // A nudged bone can end up at a pole itself, so its parents are checked after it.
     for (size_t row = kHostRowCount; row-- > 0;)
     {
         if (joints_[row] != CJointTree::kNone)
@@ -60,7 +60,7 @@ Vec3 CRowTurner::Axis(size_t row) const
     return host.aim == EHostAim::Child ? target_.ChildAxis(host.target) : kVec3UnitY;
 }
 
-// The joint that a source bone's direction leads to, or none.
+// Returns the joint that gives a source bone its direction, or kNone.
 int CRowTurner::AimOf(size_t row) const
 {
     const HostRow& host = kHostRows[row];
@@ -75,14 +75,14 @@ int CRowTurner::AimOf(size_t row) const
     return CJointTree::kNone;
 }
 
-// Where a source bone points at rest, in its own space.
+// Returns where a source bone points at rest, in its own space.
 Vec3 CRowTurner::RestAim(size_t row, int aim) const
 {
     const int joint = joints_[row];
     return Turned(poses_.Direction(0, joint, aim), Mat3Transpose(poses_.BoneTurn(0, joint)));
 }
 
-// Where a bone should point in the reference pose; nothing where it should stand as it does at rest.
+// Returns where a bone should point in the reference pose; nothing if it keeps its rest direction.
 std::optional<Vec3> CRowTurner::ReferenceDirection(size_t row, int aim) const
 {
     const int joint = joints_[row];
@@ -105,7 +105,7 @@ void CRowTurner::Turn(size_t row)
     if (const std::optional<Vec3> direction = ReferenceDirection(row, aim))
         turn = turn * LeastSwing(Turned(axis, turn), *direction);
     Mat3 offset = turn * Mat3Transpose(poses_.BoneTurn(m_uiReference, joints_[row]));
-    // A joint in between that turns by itself moves the aim; the rest pose is what counts.
+    // A joint in between can rotate and move the aim; the rest pose decides.
     if (aim != CJointTree::kNone)
         offset = offset * LeastSwing(Turned(axis, offset), RestAim(row, aim));
     m_kNumbers[row] = NearestOffset(offset, axis);
@@ -119,9 +119,10 @@ std::optional<double> CRowTurner::RestError(size_t row) const
     return AngleBetween(Turned(Axis(row), OffsetOf(m_kNumbers[row])), RestAim(row, aim));
 }
 
-// Whether a child's rotation against its parent's gets lost: a conversion cannot decompose it before the
-// offset (see CPoseMatcher), or the angles in the result's file do not give it back behind it. Both happen
-// where the sine of a middle angle is 1, and bones that are stiff in the source stay there for ever.
+// Returns whether a child's rotation relative to its parent gets lost: a conversion cannot decompose it
+// before the offset (see CPoseMatcher), or the Euler angles in the result do not reproduce it after the
+// offset. Both happen if the sine of a middle angle is 1, and bones that are stiff in the source would stay
+// there permanently.
 bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers, size_t child) const
 {
     for (const size_t stance : {size_t{0}, m_uiReference})
@@ -134,8 +135,7 @@ bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers, size_t child) c
     return false;
 }
 
-// The same for bones that hang from no row: the root, and thighs, whose pelvis bones stay as they are at
-// rest.
+// Same for bones whose parent has no row: the root, and the thighs, whose pelvis bones keep their rest pose.
 bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers) const
 {
     constexpr size_t kHip = 0;
@@ -168,7 +168,7 @@ bool CRowTurner::IsNearPole(size_t row, const RowNumbers& numbers) const
     return false;
 }
 
-// Turns a bone about itself where it or a bone below it would hang at a pole.
+// Nudges a bone's twist if it or a bone below would be at a pole.
 void CRowTurner::KeepOffPoles(size_t row)
 {
     constexpr float kNudges[] = {2.0f, -2.0f, 4.0f, -4.0f}; // degrees

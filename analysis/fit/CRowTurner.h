@@ -13,24 +13,23 @@
 namespace gw {
 
 inline constexpr size_t kHostRowCount = std::size(kHostRows);
-/// The source joints of the host rows, by index in the source's tree; CJointTree::kNone for a row without
-/// one.
+/// The source joints of the host rows, by index in the source's tree; CJointTree::kNone without one.
 using RowJoints = std::array<int, kHostRowCount>;
 
-/// Finds offsets and axis codes for the rows of a profile.
+/// Computes offsets and axis codes for the rows of a profile.
 class CRowTurner
 {
 public:
-    /// The tree, the poses and the target must outlive it. The body in the tree must be whole.
+    /// The tree, poses and target must outlive this object. The body in the tree must be complete.
     CRowTurner(const CJointTree& tree, const CSourcePoses& poses, const CTargetBones& target,
                const RowJoints& joints);
 
     const RowNumbers& Numbers(size_t row) const { return m_kNumbers[row]; }
-    /// Whether a row is turned about its bone by a degree or two more than it needs to, to keep a bone below
-    /// it from where a conversion could not follow.
+    /// Returns whether a row's twist is a degree or two off the best one, to keep a bone below it away from a
+    /// pole that a conversion could not handle.
     bool IsNudged(size_t row) const { return m_kNudged[row]; }
-    /// The angle between both bones' directions in the source's rest pose, degrees; nothing for a bone that
-    /// ends in no joint.
+    /// Returns the angle in degrees between both bones' directions in the source's rest pose; nothing for a
+    /// bone that does not lead to a joint.
     std::optional<double> RestError(size_t row) const;
 
 private:

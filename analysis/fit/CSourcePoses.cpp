@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// The axes of a body at rest are those of the file, but for what a leaning spine or uneven hips make of them.
+// A body's axes at rest are those of the file, except for a leaning spine or uneven hips.
 Mat3 SnappedToAxes(const Mat3& axes)
 {
     constexpr float kNear = 0.85f; // cosine, 32 degrees
@@ -24,7 +24,7 @@ Mat3 SnappedToAxes(const Mat3& axes)
     return isWhole ? snapped : axes;
 }
 
-// Legs that are spread roll the feet, whose soles are taken to lie flat.
+// Spread legs roll the feet, whose soles are assumed to be flat.
 bool HasLegsTogether(const BodyStance& stance)
 {
     constexpr double kMostApart = 37.0; // degrees

@@ -15,9 +15,9 @@ public:
     explicit CTargetBones(CNode& root) : m_kNames(&root) {}
 
     bool Has(std::string_view bone) const { return m_kNames.Find(bone) != nullptr; }
-    /// From the bone's space to the world; the identity for a bone that is not there.
+    /// Returns the rotation from the bone's space to world space; the identity if the bone does not exist.
     Mat3 RestTurn(std::string_view bone) const;
-    /// The unit direction from a bone to its first child, in the bone's space; +Y where there is none.
+    /// Returns the unit direction from a bone to its first child, in the bone's space; +Y without a child.
     Vec3 ChildAxis(std::string_view bone) const;
 
 private:

@@ -1,3 +1,9 @@
+// Chooses a bone map for a source. Every map is matched against the source's bone names. If only the first
+// choice is needed, maps whose first rows name a missing bone are skipped, which is nearly all of them. If
+// none fits as it is, the maps are tried again with the source's name prefix in place of their own. Maps that
+// fit are then judged by the geometry of the joints (JudgeProfile), which costs far more than matching, and
+// sorted.
+
 #include "ChooseProfile.h"
 
 #include "CRetargeter.h"
@@ -21,7 +27,7 @@ namespace gw {
 
 namespace {
 
-// Both skeletons, looked at once for all profiles.
+// Both skeletons, analyzed once for all profiles.
 class CSkeletons
 {
 public:
@@ -36,7 +42,7 @@ public:
     const std::vector<std::string>& SourceNames() const { return m_kSourceNames.Names(); }
 
 private:
-    // What takes a walk over poses waits for the first profile that fits.
+    // Analysis that needs several poses is delayed until a profile fits.
     const SourceBody& Body()
     {
         if (!body_)
@@ -64,7 +70,7 @@ void CSkeletons::Judge(ProfileChoice& choice)
     choice.verdict = JudgeProfile(table, m_kTargetNodes, Body());
 }
 
-// Larger is better. A profile of which rows do not fit is ranked by the share of those that do.
+// Larger is better. A profile that does not fit completely is ranked by its share of matching rows.
 auto Rank(const ProfileChoice& choice)
 {
     const RowMatch& match = choice.match;
@@ -84,7 +90,7 @@ ProfileChoice Adapted(const ProfileChoice& choice, const std::string& oldPrefix,
     return adapted;
 }
 
-// A prefix before what a profile's names are, and in place of a prefix of their own.
+// Variants of a profile with a prefix before its names, and with a prefix in place of its own.
 std::vector<ProfileChoice> AdaptedOnes(const ProfileChoice& choice, const std::vector<std::string>& prefixes,
                                        CSkeletons& skeletons)
 {
@@ -105,7 +111,7 @@ std::vector<ProfileChoice> AdaptedOnes(const ProfileChoice& choice, const std::v
     return whole;
 }
 
-// Those with much of the source's prefix as their own come first: their names say most about it.
+// Profiles whose own prefix resembles the source's come first, because their names are the most significant.
 std::vector<ProfileChoice> AdaptToPrefix(const std::vector<ProfileChoice>& choices, CSkeletons& skeletons)
 {
     std::vector<std::string> prefixes = SharedPrefixes(skeletons.SourceNames());
@@ -124,8 +130,8 @@ std::vector<ProfileChoice> AdaptToPrefix(const std::vector<ProfileChoice>& choic
     return whole;
 }
 
-// A verdict costs more than all rows: where only the first one counts, those with fewer rows than another
-// need none.
+// A verdict costs more than matching all rows. If only the first choice matters, profiles with fewer rows
+// than another need none.
 void JudgeWhole(std::vector<ProfileChoice>& choices, CSkeletons& skeletons, EJudged judged)
 {
     int mostRows = 0;
@@ -155,7 +161,7 @@ std::vector<ProfileChoice> ReadAll(std::span<const LoadedProfile> profiles, cons
     return choices;
 }
 
-// Those that can be whole.
+// Reads only the profiles that can fit completely.
 std::vector<ProfileChoice> ReadPromising(std::span<const LoadedProfile> profiles, const CSkeletons& skeletons)
 {
     std::vector<LoadedProfile> promising;

@@ -11,35 +11,35 @@
 
 namespace gw {
 
-/// One profile, held against a source.
+/// A profile matched against a source.
 struct ProfileChoice
 {
     std::string path;     ///< of the profile's file
-    ProfileRows profile;  ///< what the file says, or what became of it
-    bool adapted = false; ///< rows and name are those for the prefix of the source's names, not the file's
+    ProfileRows profile;  ///< the file's content, or its adapted form
+    bool adapted = false; ///< rows and name use the prefix of the source's names, not the file's
     RowMatch match;
-    ProfileVerdict verdict; ///< of a profile whose rows all fit
+    ProfileVerdict verdict; ///< set if all rows fit
 };
 
-/// A profile's file with its text, which has been read already.
+/// A profile's path and its text, already read.
 struct LoadedProfile
 {
     std::string path;
     std::string_view text; ///< must outlive the choice
 };
 
-/// Which of the profiles that fit get a verdict.
+/// Which of the fitting profiles are judged.
 enum class EJudged : uint8_t
 {
     All,
-    First, ///< those that may be first; the others are behind them in no particular order, or left out
+    First, ///< those that can come first; the rest follow unsorted or are left out
 };
 
-/// Holds profiles against a source, the best one first. Those of which all rows fit go before the others, and
-/// of them more rows before fewer, then what is not doubtful, then what leaves out fewer spine joints and
-/// turns bones less; the others stand by the share of their rows that fit. What is equal stays in the order
-/// given. Where no profile fits as it is and the source's joints share a prefix, profiles that fit with that
-/// prefix, or without their own one, come first as adapted ones. Files that cannot be read are left out.
+/// Matches profiles against a source and returns them best first. Profiles whose rows all fit come first:
+/// those with more rows, then those without grave doubts, then those that leave out fewer spine joints and
+/// rotate bones less. The others are sorted by their share of fitting rows. Ties keep the given order. If no
+/// profile fits and the source's names share a prefix, profiles that fit with that prefix added or replaced
+/// come first, marked as adapted. Unreadable files are left out.
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
                                          CNode& targetRoot, EJudged judged = EJudged::All);
 std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, CNode& sourceRoot,

@@ -8,28 +8,28 @@
 
 namespace gw {
 
-/// Where the direction of a bone of the host skeleton comes from.
+/// What the direction of a host bone is derived from.
 enum class EHostAim : uint8_t
 {
     None,
-    Next,  ///< towards the next joint that has a row
-    Child, ///< towards the joint below, where there is one: a foot
-    Hand,  ///< towards the knuckles, else as the forearm
+    Next,  ///< the next joint that has a row
+    Child, ///< the joint below, if any (feet)
+    Hand,  ///< the knuckles, otherwise the forearm's direction
     Head,  ///< upright in a stance
 };
 
-/// What drives a bone of the host skeleton, and how it hangs together with others.
+/// What drives a host bone, and how it is related to others.
 struct HostRow
 {
     const char* target;
     EBodyJoint joint;
     EBodySide side;
     EHostAim aim;
-    int next;   ///< how many of the rows behind it may be its next joint, the first that has a source counts
-    int parent; ///< how many rows before it the row of its parent stands; 0 where that has no source
+    int next;   ///< how many of the following rows can be its next joint; the first with a source is used
+    int parent; ///< how many rows before it its parent's row is; 0 if the parent has no source
 };
 
-/// The host skeleton's bones, in the order of its profiles.
+/// The host skeleton's bones, in profile order.
 inline constexpr HostRow kHostRows[] = {
     {kRootBone,            EBodyJoint::Hip,      EBodySide::Left,  EHostAim::Next,  2, 0},
     {kWaistBone,           EBodyJoint::Spine,    EBodySide::Left,  EHostAim::Next,  1, 1},

@@ -16,7 +16,7 @@ namespace gw {
 
 namespace {
 
-// Half way from a frame that stands right to one that stands across, with room for a limb that is bent.
+// Between a bone that comes out right and one turned by 90 degrees, with room for a bent limb.
 constexpr double kAcross = 60.0;
 
 std::string NameOf(const CNode* joint)
@@ -29,8 +29,8 @@ bool IsOneOf(const std::vector<CNode*>& joints, const CNode* joint)
     return std::ranges::find(joints, joint) != joints.end();
 }
 
-// The same place for a profile: of several necks any will do, and no row tells a toe or which joints are a
-// spine's.
+// Returns whether places are equivalent for a profile: any of several necks will do, and no row names a toe
+// or distinguishes the joints of a spine.
 bool IsSamePlace(const BodyPlace& place, const CBodyMap& byNames, const CNode* joint)
 {
     if (place.joint == EBodyJoint::Neck)
@@ -56,8 +56,8 @@ void TakeNamed(CNode* named, const CNode* above, CNode*& joint)
         joint = named;
 }
 
-// No row tells a toe, and what hangs from a foot need not be one: a middle foot may even point back. Some
-// profiles leave out hands, without which one cannot tell how long a forearm is.
+// No row names a toe, and the joint below a foot need not be one: a middle foot can even point backward. Some
+// profiles leave out the hands, without which the length of a forearm is unknown.
 void AddUntold(const CBodyMap& byNames, CBodyMap& body)
 {
     for (const EBodySide side : kBodySides)
@@ -68,7 +68,7 @@ void AddUntold(const CBodyMap& byNames, CBodyMap& body)
     }
 }
 
-// A torso that a collar drives has no place in the spine.
+// A torso driven by a collar is not part of the spine.
 void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdict)
 {
     const auto place = std::ranges::find(body.spine, chest);
@@ -93,7 +93,7 @@ void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBody
 
 ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
 {
-    // A body may well have odd proportions.
+    // A body can have unusual proportions.
     const auto isGrave = [](const ProfileDoubt& doubt) {
         return doubt.kind == EProfileDoubt::Places && doubt.places != EBodyDoubt::OddLength;
     };

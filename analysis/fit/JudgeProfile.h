@@ -14,24 +14,24 @@ namespace gw {
 class CNodeNames;
 class CRetargeter;
 
-/// How sure it is that a profile's rows name the joints that they should.
+/// How certain it is that a profile's rows name the right joints.
 enum class ESureness : uint8_t
 {
-    Sure,     ///< nothing speaks against it
-    Likely,   ///< it serves, with the flaws that its doubts tell
-    Doubtful, ///< the body's places speak against it
+    Sure,     ///< nothing contradicts it
+    Likely,   ///< usable, with the flaws listed as doubts
+    Doubtful, ///< the joints' positions contradict it
 };
 
-/// What speaks against a profile.
+/// A doubt about a profile.
 enum class EProfileDoubt : uint8_t
 {
-    Places,    ///< a body of these joints cannot be; see `places`
-    OtherName, ///< by its name the joint has another part in the body, which `other` has here
-    SpineCut,  ///< spine joints above the one that drives the upper torso are left out
-    Turned,    ///< the bone comes out turned across, about a quarter turn or more
+    Places,    ///< these joints cannot form a body; see `places`
+    OtherName, ///< the joint's name says that it is a different part, which is `other` here
+    SpineCut,  ///< leaves out spine joints above the one that drives the upper torso
+    Turned,    ///< the bone is rotated by about a quarter turn or more
 };
 
-/// Whether a doubt is about which joint is which, and not about how well the bones come out.
+/// Returns whether a doubt concerns the joints' roles, not the rotation of bones.
 constexpr bool IsOfRoles(EProfileDoubt kind)
 {
     return kind == EProfileDoubt::Places || kind == EProfileDoubt::OtherName;
@@ -40,30 +40,30 @@ constexpr bool IsOfRoles(EProfileDoubt kind)
 struct ProfileDoubt
 {
     EProfileDoubt kind = EProfileDoubt::Places;
-    EBodyDoubt places = EBodyDoubt::NotBelow; ///< of Places
-    std::string joint;                        ///< name of a joint of the source
-    std::string other;                        ///< the same, or empty
+    EBodyDoubt places = EBodyDoubt::NotBelow; ///< if kind is Places
+    std::string joint;                        ///< a source joint's name
+    std::string other;                        ///< another one's name, or empty
 };
 
-/// What is told of a profile whose rows all fit.
+/// The verdict on a profile whose rows all fit.
 struct ProfileVerdict
 {
     ESureness sureness = ESureness::Sure;
     std::vector<ProfileDoubt> doubts;
     size_t leftOut = 0; ///< spine joints above the one that drives the upper torso
-    double turn = 0.0;  ///< mean angle in degrees that the bones come out turned across
+    double turn = 0.0;  ///< mean misrotation of the bones in degrees
 };
 
-/// What is looked at of a source for every profile that is judged.
+/// The analysis of a source, shared by all judged profiles.
 struct SourceBody
 {
     explicit SourceBody(CNode& root);
 
-    CBodyMap byNames; ///< as the names of the joints tell
-    CJointTree tree;  ///< and how they lie
+    CBodyMap byNames; ///< found by joint names
+    CJointTree tree;  ///< positions and lengths
 };
 
-/// Judges the rows that a retargeter was told.
+/// Judges the rows of a retargeter's table.
 ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, const SourceBody& source);
 
 } // namespace gw

@@ -56,7 +56,7 @@ ProfileRows RowsOfText(std::string_view text)
 bool MayFit(std::string_view text, const CBoneNames& sources)
 {
     CProfileReader reader(text);
-    std::vector<std::string> targets; // a second row of one target does not change its source
+    std::vector<std::string> targets; // a second row for the same target does not change its source
     const auto isKnown = [&](const std::string& target) {
         return std::ranges::any_of(targets,
                                    [&](const std::string& known) { return EqualNoCase(known, target); });

@@ -1,3 +1,7 @@
+// Measures how far each target bone would be rotated about itself. For every pose, the row's offset is
+// applied to the source bone, and the target's rest pose, swung to the source bone's direction by the
+// smallest rotation, is the reference. The remaining angle between both is the error.
+
 #include "RowTurns.h"
 
 #include "BodyTree.h"
@@ -16,13 +20,13 @@ namespace gw {
 
 namespace {
 
-// Which bone a target bone leads to. The torso's two ends, the head and the feet carry several joints or none
-// and have no direction to swing to.
+// The joint that gives a target bone its direction. The torso's two ends, the head and the feet carry several
+// joints or none, so they have no direction to swing to.
 struct LeadRow
 {
     const char* bone;
-    const char* next; ///< null for none
-    bool isHand;      ///< leads to its own fingers
+    const char* next; ///< or null
+    bool isHand;      ///< points to its own fingers
 };
 
 constexpr LeadRow kLeads[] = {
@@ -43,16 +47,16 @@ constexpr LeadRow kLeads[] = {
     {kRightBones.foot,     nullptr,              false},
 };
 
-// A row of the table, with what its direction needs.
+// A row of the table with the nodes that define its direction.
 struct Lead
 {
     CNode* target;
     CNode* source;
-    const CNode* from;        ///< the direction leads from here
-    std::vector<CNode*> next; ///< to the middle of these
+    const CNode* from;        ///< start of the direction
+    std::vector<CNode*> next; ///< the direction ends in the middle of these
 };
 
-// A hand without any goes on as the forearm does.
+// A hand without fingers continues the forearm.
 void LeadToFingers(Lead& hand)
 {
     hand.next = ChildNodes(*hand.source);
@@ -81,14 +85,14 @@ std::vector<Lead> FindLeads(const CRetargeter& table, const CNodeNames& targets)
     return leads;
 }
 
-// Places near the end of 32 bits give no number; such a bone stands as wrong as can be.
+// Positions near the limits of 32-bit floats yield NaN; such a bone counts as completely wrong.
 double AngleBetweenRotations(const Mat3& a, const Mat3& b)
 {
     const double angle = AngleOf(a * Mat3Transpose(b));
     return std::isfinite(angle) ? angle : 180.0;
 }
 
-// Where the source's bone leads to in the body's own axes; nothing where joints coincide.
+// Returns where the source's bone points, in the body's own axes; nothing if joints coincide.
 std::optional<Vec3> Direction(const Lead& lead, const CBodyPoses& poses, const Mat3& toBody)
 {
     Vec3 sum = kVec3Zero;
@@ -105,7 +109,7 @@ double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses)
     const Mat3 toBody = Mat3Transpose(poses.Axes());
     const Mat3 offset = OffsetRotation(table.OffsetAngles(lead.target), table.OffsetMatrix(lead.target));
     const Mat3 turned = offset * NormalizedRows(poses.BoneWorld(*lead.source)) * toBody;
-    // The target stands along the axes at rest: left is x, up is y.
+    // At rest the target is aligned to the axes: left is x, up is y.
     Mat3 wanted = NormalizedRows(RestWorld(*lead.target));
     if (const std::optional<Vec3> direction = Direction(lead, poses, toBody))
         wanted = wanted * LeastSwing(wanted.Row(1), *direction);

@@ -8,11 +8,11 @@ namespace gw {
 
 namespace {
 
-// A root above the body, props and helpers often stand outside the namespace.
+// A root above the body, props and helpers are often outside the namespace.
 constexpr double kNearlyAll = 0.8;
-// A prefix is a habit of several joints; two joints of one letter have none.
+// A prefix is shared by several joints; two joints with the same first letter do not have one.
 constexpr size_t kLeastNames = 5;
-// A body's joints stand among the first.
+// A body's joints are among the first.
 constexpr size_t kNamesLooked = 256;
 constexpr std::string_view kSeparators = ":_-";
 
@@ -23,8 +23,8 @@ size_t LengthInCommon(std::string_view a, std::string_view b)
     return static_cast<size_t>(ends.in1 - a.begin());
 }
 
-// In sorted order the names that share a start stand side by side, so that the longest start of so many names
-// is that of the ends of a window.
+// Names with the same start are neighbors in sorted order, so the longest start of `count` names is found by
+// comparing the ends of a window.
 std::string LongestStart(std::span<const std::string> sorted, size_t count)
 {
     std::string_view longest;
@@ -53,7 +53,7 @@ std::vector<std::string> SharedPrefixes(std::span<const std::string> names)
     {
         prefixes.push_back(start);
         start.pop_back();
-        start.resize(start.find_last_of(kSeparators) + 1); // 0 where there is none
+        start.resize(start.find_last_of(kSeparators) + 1); // 0 without a separator
     }
     return prefixes;
 }

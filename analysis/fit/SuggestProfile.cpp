@@ -1,3 +1,7 @@
+// Drafts a bone map from the body found in a source. Each host bone gets the source joint with the same role;
+// CRowTurner computes its offset. Rows without a joint, or with a joint whose name a map cannot hold, are
+// kept in the draft so that a user can see them, but not written to the map.
+
 #include "SuggestProfile.h"
 
 #include "CJointTree.h"
@@ -60,7 +64,7 @@ SuggestedProfile CSuggester::Suggest() const
     return profile;
 }
 
-// Names with blanks are cut in a profile, and of two equal ones the first counts.
+// A profile cuts names at blanks, and uses the first of two equal names.
 bool CSuggester::CanName(const CNode* node) const
 {
     if (!node)
@@ -77,7 +81,7 @@ CNode* CSuggester::SourceOf(size_t index) const
     return JointAt(m_kFound.body, {kHostRows[index].joint, kHostRows[index].side});
 }
 
-// The spine joint at the height where the target's waist begins, a fifth of the way from hip to neck. None in
+// Returns the spine joint at the height of the target's waist, a fifth of the way from hip to neck. Null for
 // a spine of one joint, which drives the upper torso.
 CNode* CSuggester::LowerSpine() const
 {

@@ -13,63 +13,65 @@ namespace gw {
 
 class CNode;
 
-/// What a row of a suggested profile does.
+/// The kind of a suggested row.
 enum class ESuggestedRow : uint8_t
 {
-    Turned,   ///< a source bone drives the target's, through offset and axes
-    Neutral,  ///< the same without any: thighs and shins
-    Fixed,    ///< no source drives it, as the rules have it
-    NoSource, ///< the skeleton has no such joint, and no row stands in the profile
-    NoName,   ///< there is a joint, and a profile cannot name it: see SuggestedRow::source
+    Turned,   ///< a source bone drives the target's through offset and axes
+    Neutral,  ///< same without offset and axes: thighs and shins
+    Fixed,    ///< not driven by a source, by definition of the format
+    NoSource, ///< the skeleton has no such joint; not written to the profile
+    NoName,   ///< the joint exists, but a profile cannot hold its name: see SuggestedRow::source
 };
 
 enum class ERowSureness : uint8_t
 {
     Sure,   ///< name and shape agree
-    Likely, ///< one of them tells, and the other does not contradict
-    Unsure, ///< look at it
+    Likely, ///< supported by one and not contradicted by the other
+    Unsure, ///< check this row
 };
 
-/// A row that was thought of, with what is known about it.
+/// A considered row, with the evidence for it.
 struct SuggestedRow
 {
     std::string target;
     CNode* source = nullptr;
-    BodyPlace place; ///< what the source is in its body
+    BodyPlace place; ///< the source's role in its body
     ESuggestedRow kind = ESuggestedRow::Turned;
     RowNumbers numbers;
     EBodyEvidence evidence = EBodyEvidence::None;
     ERowSureness sureness = ERowSureness::Sure;
-    std::vector<EBodyDoubt> doubts; ///< that concern the joint
-    bool nudged =
-        false; ///< turned a little about itself, to keep a bone below from where it cannot be followed
-    /// Between the directions of both bones in the source's rest pose, degrees; nothing where one has none.
+    std::vector<EBodyDoubt> doubts; ///< concerning this joint
+    bool nudged = false;            ///< twist slightly off, to keep a bone below away from a pole
+    /// Angle in degrees between both bones' directions in the source's rest pose; nothing if one has no
+    /// direction.
     std::optional<double> restError;
 
     bool IsMapping() const { return kind <= ESuggestedRow::Neutral; }
 };
 
-/// A profile for a skeleton, and how it came about.
+/// A profile for a skeleton, with its evidence.
 struct SuggestedProfile
 {
-    std::vector<SuggestedRow> rows; ///< in the order of the target's bones, with those that came to nothing
-    std::vector<BodyPlace> missing; ///< of the thirteen joints: none in a profile that drives the whole body
-    bool sidesAreSure = true;       ///< names or poses show which side is the left one
-    bool restIsStance = true;       ///< a body could stand as it does at rest
-    bool turnsFromRest = true;      ///< else the turns about the bones come from a frame of the motion
+    /// in the order of the target's bones, including rows that are not written
+    std::vector<SuggestedRow> rows;
+    /// of the thirteen required joints; empty for a profile that drives the whole body
+    std::vector<BodyPlace> missing;
+    bool sidesAreSure = true;  ///< names or poses show which side is left
+    bool restIsStance = true;  ///< the rest pose is a standing pose
+    bool turnsFromRest = true; ///< otherwise, twists come from a frame of the motion
 
-    /// The rows that stand in the profile.
+    /// Returns the rows that are written to the profile.
     CMapRowTable Table() const;
 };
 
-/// Makes a profile for a skeleton from its body (FindBody) and the rest poses of both skeletons. Each offset
-/// makes a target bone point as the source's bone does in every pose in which the source's bone is rigid, the
-/// rest pose of the source at the least, and turns it about itself as little as can be against the target's
-/// rest pose. The trees are posed meanwhile and left as they were.
+/// Creates a profile for a skeleton from its body (FindBody) and the rest poses of both skeletons. Each
+/// offset makes the target bone point like the source bone, in the source's rest pose at least and in every
+/// pose in which the bone is rigid, with the smallest possible twist relative to the target's rest pose. The
+/// trees are posed during the call and restored.
 SuggestedProfile SuggestProfile(CNode& sourceRoot, CNode& targetRoot);
 
-/// A display name for a profile that was made for a file: its name without folder and extension, with blanks
-/// for underscores; `stem` may be of any length.
+/// Returns a display name for a profile made for a file: the file name without folder and extension, with
+/// blanks for underscores. `stem` can have any length.
 std::string SuggestedName(std::string_view stem);
 
 } // namespace gw

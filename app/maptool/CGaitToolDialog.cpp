@@ -1,3 +1,6 @@
+// The map tool's state machine, without its window. Each operation either succeeds completely or leaves
+// motions, trees and lines as they were, and ends by setting the status line.
+
 #include "CGaitToolDialog.h"
 
 #include "CPlatform.h"
@@ -18,7 +21,7 @@ namespace gw {
 namespace {
 
 constexpr const char* kBaseFile = "base.htr";
-// Of sixty frames one is saved, as the tool has always done; the user is told.
+// One frame in sixty is saved, as the tool has always done; the user is told.
 constexpr float kSavedScale = 0.016667f;
 constexpr const char* kSavedNote = ", every sixtieth frame";
 
@@ -30,7 +33,7 @@ constexpr void (CMotionView::*kTransport[])() = {
     &CMotionView::Play,      &CMotionView::StepForward,
 };
 
-// A tree of another skeleton; the selection stays where a bone of its name is there.
+// Shows the tree of another skeleton, keeping the selected bone if one with that name exists.
 void Rebuild(CBoneTree& tree, CNode* root)
 {
     const std::string selected = tree.SelectedText();
@@ -174,7 +177,7 @@ bool CGaitToolDialog::LoadSource(const std::string& path)
     const CWaitCursor wait(window_);
     if (!Load(EToolMotion::Source, path))
         return false;
-    // A target is there from now on. Where it cannot be read, that is what the user must know first.
+    // The target is loaded from now on. If it cannot be read, that is the first thing the user must know.
     const std::string loaded = m_kStatus;
     if (LoadTargetMotions(platform_.DataFolder() + kBaseFile))
         m_kStatus = loaded;
@@ -199,8 +202,7 @@ bool CGaitToolDialog::LoadTargetMotions(const std::string& path)
     return true;
 }
 
-// Reads into a file of its own: one that had trees would keep the rest pose of the motion before where the
-// new file has none.
+// Reads into a new motion file: an existing one would keep its previous rest pose if the new file has none.
 bool CGaitToolDialog::Load(EToolMotion motion, const std::string& path)
 {
     CMotionFile file;
@@ -226,7 +228,7 @@ void CGaitToolDialog::ShowMotion(EToolMotion motion)
         View(motion)->SetScene(Root(motion), timing.FrameStep(), timing.lastFrame);
 }
 
-// The trees of other skeletons, and the lines that still say something about them.
+// Shows the new skeletons' trees, and removes lines that no longer fit.
 void CGaitToolDialog::TakeSkeletons()
 {
     Rebuild(m_kSourceTree, Root(EToolMotion::Source));
@@ -243,7 +245,7 @@ void CGaitToolDialog::Convert()
         if (View(motion))
             View(motion)->Stop();
     }
-    // A conversion leaves its own rest pose behind, on which the next one must not build.
+    // A conversion leaves its own rest pose behind, which the next one must not use.
     if (m_bConverted && !Load(EToolMotion::Result, m_kTargetPath))
         return;
     CRetargeter retargeter;
@@ -259,7 +261,7 @@ void CGaitToolDialog::Convert()
     m_kStatus = ConvertedWords(Motion(EToolMotion::Result), retargeter.Record());
 }
 
-// A bone that is not there is null, as a key or as a source, which the retargeter takes for none.
+// A missing bone is null, which the retargeter treats as no bone.
 void CGaitToolDialog::ApplyLine(CRetargeter& retargeter, const MapLine& line, const CBoneNames& sources,
                                 const CBoneNames& targets)
 {

@@ -16,7 +16,7 @@ class CBoneNames;
 class CPlatform;
 class CRetargeter;
 
-/// Controls of the map tool beside its transport buttons, with the numbers that they have always had.
+/// Control ids of the map tool, apart from its transport buttons; the numbers never change.
 enum EToolControl : int
 {
     kToolClose = 1,
@@ -33,17 +33,16 @@ enum EToolControl : int
     kToolDetail = 1033,
 };
 
-/// The five transport buttons of each motion: to the start, a step back, stop, play, a step on.
+/// The five transport buttons of each motion: first frame, step back, stop, play, step forward.
 inline constexpr int kTransportIds[3][5] = {
     {1010, 1017, 1018, 1019, 1020},
     {1021, 1022, 1023, 1024, 1025},
     {1026, 1027, 1028, 1029, 1030},
 };
 
-/// The map tool without its window: three motions, two trees of bones and a list of map lines by which one
-/// motion is converted onto the skeleton of another. A window shows what the accessors answer and forwards
-/// what the user does. Nothing is asked and nothing is reported in boxes: what became of an operation stands
-/// in Status().
+/// The map tool without its window: three motions, two bone trees and a list of map lines that convert one
+/// motion to another's skeleton. A window displays the accessors' values and forwards user actions. Nothing
+/// is asked or reported in message boxes; Status() describes the outcome of the last operation.
 class CGaitToolDialog
 {
 public:
@@ -55,35 +54,35 @@ public:
     CGaitToolDialog(const CGaitToolDialog&) = delete;
     CGaitToolDialog& operator=(const CGaitToolDialog&) = delete;
 
-    /// Takes the views from the window. All else works without them.
+    /// Creates the views through the window. Everything else works without them.
     void OnInitDialog();
 
-    // What a window delivers.
-    /// A button was clicked; nothing for a disabled one and for ids that are none.
+    // Events from a window.
+    /// Handles a button click; ignores disabled buttons and unknown ids.
     void ClickButton(int id);
-    /// A line was selected, or none with -1. The bones of a mapping are selected in the trees.
+    /// Selects a line, or none with -1, and the bones of a mapping in the trees.
     void SelectLine(int index);
     void SelectSourceItem(int item) { m_kSourceTree.Select(item); }
     void SelectTargetItem(int item) { m_kTargetTree.Select(item); }
-    /// Whether a file may be dropped at all, by its extension.
+    /// Returns whether a file can be dropped, by its extension.
     static bool TakesFile(const std::string& path);
-    /// A file was dropped on the view of a motion: loads it there. False for the result, which is no file's.
+    /// Loads a file dropped on a motion's view. Returns false for the result, which cannot be loaded.
     bool DropFile(EToolMotion motion, const std::string& path);
-    /// One tick of the clock for all three views; whether any of them still plays.
+    /// Advances the clock of all three views by one tick. Returns whether any of them is still playing.
     bool Advance();
 
-    // The operations behind. False leaves motions and lines as they were; the status says why.
-    /// Besides the source, takes the fixed target skeleton again.
+    // Operations. If one fails, it returns false and leaves motions and lines unchanged; the status says why.
+    /// Loads a source, and reloads the fixed target skeleton.
     bool LoadSource(const std::string& path);
     bool LoadTarget(const std::string& path);
     bool LoadMap(const std::string& path);
     bool SaveMap(const std::string& path);
-    /// Moves the result after the source as the lines say. Bones that are not there have no effect.
+    /// Moves the result like the source, according to the lines. Missing bones have no effect.
     void Convert();
     /// Writes the result, or before a conversion the target's own motion.
     bool SaveResult(const std::string& path);
 
-    // What a window shows.
+    // State for a window to show.
     bool IsEnabled(int id) const;
     const CMapLineList& Map() const { return m_kMap; }
     const CBoneTree& SourceTree() const { return m_kSourceTree; }
@@ -91,17 +90,17 @@ public:
     const CMotionFile& Motion(EToolMotion motion) const { return m_kMotions[Index(motion)]; }
     bool IsConverted() const { return m_bConverted; }
     bool IsPlaying() const;
-    /// The frame that a view shows, from 0 on, and the last one of its motion.
+    /// Returns the frame that a view shows, starting at 0, and the last frame of its motion.
     int FrameOf(EToolMotion motion) const;
     int LastFrameOf(EToolMotion motion) const;
-    /// What became of the last operation, as a sentence; safe to print.
+    /// Returns the outcome of the last operation as a sentence that is safe to print.
     const std::string& Status() const { return m_kStatus; }
 
 private:
     struct Command;
     static const Command* FindCommand(int id);
 
-    // The commands of the buttons.
+    // Button commands.
     void AskSource();
     void AskTarget();
     void AddToMap();
@@ -113,7 +112,7 @@ private:
     void EditDetail();
     void Close() { window_.CloseWindow(); }
 
-    // When they take a click.
+    // Conditions under which buttons are enabled.
     bool Always() const { return true; }
     bool HasBothTrees() const { return !m_kSourceTree.Items().empty() && !m_kTargetTree.Items().empty(); }
     bool HasLines() const { return !m_kMap.IsEmpty(); }
@@ -136,12 +135,12 @@ private:
     CToolWindow& window_;
     const CPlatform& platform_;
     std::array<CMotionFile, 3> m_kMotions;
-    std::string m_kTargetPath; ///< of the file that target and result were read from
+    std::string m_kTargetPath; ///< the file that target and result were read from
     std::array<std::unique_ptr<CMotionView>, 3> m_kViews;
     CBoneTree m_kSourceTree;
     CBoneTree m_kTargetTree;
     CMapLineList m_kMap;
-    bool m_bConverted = false; ///< the result moves after the source, and no longer stands as it was read
+    bool m_bConverted = false; ///< the result follows the source and differs from the file
     std::string m_kStatus;
 };
 

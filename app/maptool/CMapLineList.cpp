@@ -21,7 +21,7 @@ bool SpeaksOfPosition(const MapLine& line)
     return LowerCase(line.text).find(kPosition) != std::string::npos;
 }
 
-// A keyword further inside, as in "Composition", makes a line of its kind all the same but sets nothing.
+// A keyword further inside, as in "Composition", makes a line of its kind but sets nothing.
 bool BeginsWith(const MapLine& line, std::string_view keyword)
 {
     return EqualNoCase(std::string_view(line.text).substr(0, keyword.size()), keyword);
@@ -114,7 +114,7 @@ size_t CMapLineList::Prune(const Fits& fits)
     return before.size() - m_kLines.size();
 }
 
-// The line that moves up is selected next, so that a run of lines goes by repeated clicks.
+// Selects the line that moves up, so that repeated clicks remove a run of lines.
 void CMapLineList::RemoveSelected()
 {
     if (m_iSelected == kNone)

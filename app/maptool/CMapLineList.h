@@ -9,40 +9,42 @@
 
 namespace gw {
 
-/// The map tool's list of lines, of which one may be selected, and the two values that lines set.
+/// The map tool's list of lines, at most one of them selected, and the two values that lines set.
 class CMapLineList
 {
 public:
     static constexpr int kNone = -1;
-    /// Whether both bones of a mapping are there.
+    /// Returns whether both bones of a mapping exist.
     using Fits = std::function<bool(const MapLine&)>;
 
     const std::vector<MapLine>& Lines() const { return m_kLines; }
     bool IsEmpty() const { return m_kLines.empty(); }
-    /// The index of the selected line, or kNone.
+    /// Returns the index of the selected line, or kNone.
     int Selected() const { return m_iSelected; }
-    /// Null when there is none.
+    /// Returns the selected line, or null.
     const MapLine* SelectedLine() const;
-    /// Selects a line, or with any other index none.
+    /// Selects a line; any invalid index selects none.
     void Select(int index);
 
-    /// Appends a mapping without a rotation, and before it the three lines of a map's head where no line
-    /// speaks of a position yet.
+    /// Appends a mapping without rotation. If no line sets a position yet, first appends the three header
+    /// lines of a map.
     void Add(std::string_view source, std::string_view target);
-    /// Takes the lines of a file for those that stand here, and the values that they set. Mappings that do
-    /// not fit are left out; answers how many.
+    /// Replaces all lines and the values that they set by those of a file. Mappings that do not fit are left
+    /// out; returns their number.
     size_t Replace(const std::vector<MapLine>& lines, const Fits& fits);
-    /// Takes out every line that is no mapping that fits, the head too; answers how many.
+    /// Removes every line except mappings that fit, including the header. Returns the number of lines
+    /// removed.
     size_t Prune(const Fits& fits);
     void RemoveSelected();
     void Clear();
-    /// Puts another line into the place of the selected one and selects it.
+    /// Replaces the selected line and selects the new one.
     void ReplaceSelected(const MapLine& line);
 
-    /// Where a conversion's root begins, in the target's unit: as the last line that said so was read.
+    /// Returns the start position of a conversion's root, in the target's unit, from the last line read that
+    /// sets it.
     const Vec3& RootPosition() const { return m_kRootPosition; }
     int FrameRate() const { return m_iFrameRate; }
-    /// Takes the value of a line that begins with its keyword.
+    /// Applies the value of a line that begins with its keyword.
     void TakeValue(const MapLine& line);
 
 private:
@@ -57,8 +59,8 @@ private:
     static constexpr int kDefaultFrameRate = 60;
 };
 
-/// The line as the tool writes it anew from its kind, its bones and its values. A text is cut to the
-/// characters that the tool's field takes.
+/// Returns the line as the tool writes it, from its kind, bones and values. Text is cut to the length of the
+/// tool's field.
 MapLine RewrittenLine(const MapLine& line);
 
 } // namespace gw

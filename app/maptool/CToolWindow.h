@@ -22,20 +22,19 @@ enum class EToolMotion : uint8_t
 
 inline constexpr EToolMotion kToolMotions[] = {EToolMotion::Source, EToolMotion::Target, EToolMotion::Result};
 
-/// The window as the map tool sees it.
+/// The window as seen by the map tool.
 class CToolWindow
 {
 public:
     virtual ~CToolWindow() = default;
 
-    /// A path, or none when the dialog was cancelled.
+    /// Returns a path, or nothing if the dialog was canceled.
     virtual std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) = 0;
-    /// The same; the dialog itself asks before a file is replaced.
+    /// Same for saving; the dialog itself asks before a file is replaced.
     virtual std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) = 0;
-    /// Shows the dialog of the line's kind until the user ends it: numbers, frame rate or text may be others
-    /// then. True on OK.
+    /// Runs the dialog for the line's kind, which can change numbers, frame rate or text. Returns true on OK.
     virtual bool EditLine(MapLine& line) = 0;
-    /// The view of a motion, or null where there is none.
+    /// Returns the view of a motion, or null.
     virtual std::unique_ptr<CMotionView> CreateView(EToolMotion) { return nullptr; }
     virtual void CloseWindow() = 0;
     virtual void BeginWaitCursor() {}

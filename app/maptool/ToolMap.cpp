@@ -1,4 +1,4 @@
-// What the map tool's buttons do to the list of lines.
+// The map tool's buttons that change the list of lines.
 
 #include "CGaitToolDialog.h"
 
@@ -25,7 +25,7 @@ bool CGaitToolDialog::IsMappable(const MapLine& line) const
            m_kTargetTree.Find(line.target) != CBoneTree::kNone;
 }
 
-// Markers follow from the lines, so that a bone loses its own with the last line that names it.
+// Markers are derived from the lines, so a bone loses its marker with the last line that names it.
 void CGaitToolDialog::MarkBones()
 {
     UnmarkAll(m_kSourceTree);

@@ -34,7 +34,7 @@ std::string Said(const std::string& path, const CFailure& failure, bool warning)
     return ReportLine(MakeReport(FileName(path), failure, warning));
 }
 
-// Reasons that mean something else at a save than at a load.
+// Reasons with a different meaning when saving than when loading.
 struct SaveWords
 {
     EFailure m_eReason;

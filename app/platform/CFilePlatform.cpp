@@ -1,3 +1,6 @@
+// Settings and folders by the freedesktop rules. A value is looked up in the user's folder, then in the
+// system's in order; in each, the program's own file comes before the maker's.
+
 #include "CFilePlatform.h"
 
 #include "CMappedFile.h"
@@ -16,7 +19,7 @@ namespace {
 
 constexpr std::string_view kMaker = "Tessarine";
 constexpr std::string_view kProgramFile = "Tessarine/Gaitwright.conf";
-constexpr std::string_view kMakerFile = "Tessarine.conf"; // what all programs of the maker share
+constexpr std::string_view kMakerFile = "Tessarine.conf"; // shared by all programs of the maker
 constexpr std::string_view kSection = "Settings";
 constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // of an installation
 
@@ -26,7 +29,8 @@ std::string Environment(const char* name)
     return value ? value : "";
 }
 
-// Beside the executable, as in a build. An installation keeps apart what is the same on every machine.
+// Next to the executable, as in a build. An installation keeps machine-independent files in a separate
+// folder.
 std::string OwnDataFolder()
 {
     std::string beside = ExecutableFolder();
@@ -34,7 +38,7 @@ std::string OwnDataFolder()
     return !FileExists(beside + kTargetFile) && FolderExists(shared) ? shared : beside;
 }
 
-// An environment variable that holds an absolute path; relative ones do not count.
+// Returns an environment variable that holds an absolute path; relative paths are ignored.
 std::string AbsolutePath(const char* name, const std::string& otherwise)
 {
     const std::string path = Environment(name);
@@ -52,7 +56,7 @@ std::vector<std::string> SplitList(std::string_view list)
     return paths;
 }
 
-// Empty for a file that is not there; false for one that is there and cannot be read.
+// Reads a file into text, empty if it does not exist; false if it exists but cannot be read.
 bool ReadText(const std::string& path, std::string& text)
 {
     CMappedFile file;
@@ -68,7 +72,7 @@ std::string TextOf(const std::string& path)
     return text;
 }
 
-// The folder that a line of user-dirs.dirs names: XDG_DOCUMENTS_DIR="$HOME/Documents".
+// Returns the folder in a line of user-dirs.dirs: XDG_DOCUMENTS_DIR="$HOME/Documents".
 std::string NamedFolder(std::string_view line, std::string_view name, const std::string& home)
 {
     line = line.substr(std::min(line.find_first_not_of(" \t"), line.size()));
@@ -81,7 +85,7 @@ std::string NamedFolder(std::string_view line, std::string_view name, const std:
     return path.starts_with('/') ? std::string(path) : std::string();
 }
 
-// The last two parts of a registry path: product and version.
+// Splits off the last two parts of a registry path: product and version.
 bool SplitKeyPath(const std::string& keyPath, std::string& product, std::string& version)
 {
     const size_t last = keyPath.rfind('\\');
@@ -114,7 +118,7 @@ CFilePlatform::CFilePlatform(EPlatformWriting writing, std::string dataFolder)
         m_kSystemFolders.emplace_back("/etc/xdg/");
 }
 
-// A program's own file counts more than the maker's, and an earlier folder more than a later one.
+// The program's own file comes before the maker's, and an earlier folder before a later one.
 std::string CFilePlatform::FindValue(const std::vector<std::string>& folders, std::string_view file,
                                      std::string_view section, std::string_view key) const
 {

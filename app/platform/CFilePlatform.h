@@ -7,20 +7,21 @@
 
 namespace gw {
 
-/// Whether a platform leaves anything behind.
+/// Whether a platform may write anything.
 enum class EPlatformWriting
 {
-    No,  ///< settings are not stored and folders not made
+    No,  ///< settings are not stored and folders not created
     Yes, ///< as a desktop program does
 };
 
-/// The platform of a system with the freedesktop folders, in plain files and without a toolkit: settings in
+/// The platform for systems with freedesktop folders, using plain files and no toolkit: settings in
 /// Tessarine/Gaitwright.conf of the configuration folders, the host product's keys in Tessarine/PRODUCT.conf
-/// of the system's ones. The environment is read once, when it is made.
+/// of the system's folders. The environment is read once, by the constructor.
 class CFilePlatform : public CPlatform
 {
 public:
-    /// The data folder replaces the program's own unless it is empty: the executable's, or an installation's.
+    /// `dataFolder`, unless empty, replaces the program's data folder (the executable's or an
+    /// installation's).
     explicit CFilePlatform(EPlatformWriting writing, std::string dataFolder = {});
 
     std::string ReadSetting(const std::string& key) const override;
@@ -38,8 +39,8 @@ private:
     bool m_bWriting;
     std::string m_kDataFolder;
     std::string m_kHome;
-    std::string m_kUserFolder;                 ///< the user's configuration
-    std::vector<std::string> m_kSystemFolders; ///< the system's, the first one counts most
+    std::string m_kUserFolder;                 ///< user's configuration folder
+    std::vector<std::string> m_kSystemFolders; ///< system's configuration folders, most important first
 };
 
 } // namespace gw

@@ -12,17 +12,17 @@ namespace gw {
 namespace {
 
 using SharedCount = std::atomic_ref<int32_t>;
-static_assert(SharedCount::is_always_lock_free); // else the lock would lie in one process only
+static_assert(SharedCount::is_always_lock_free); // otherwise the lock would be local to a process
 
-// Anybody may have made an object of this name; only that of the user counts.
+// Anybody can create an object with this name; only the user's own is accepted.
 bool IsOwn(int file)
 {
     struct stat status = {};
     return fstat(file, &status) == 0 && status.st_uid == geteuid();
 }
 
-// Null where there is none. The space is taken at once, since a full disk would else show on the first
-// access, by a signal.
+// Returns null without shared memory. Space is allocated immediately; otherwise, a full disk would show only
+// as a signal at the first access.
 int32_t* MapCount(const std::string& sharedName)
 {
     const int file = shm_open(sharedName.c_str(), O_RDWR | O_CREAT | O_CLOEXEC, S_IRUSR | S_IWUSR);

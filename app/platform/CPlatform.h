@@ -8,37 +8,37 @@ namespace gw {
 /// The target skeleton, in the data folder.
 inline constexpr const char* kTargetFile = "base.htr";
 
-/// What the program asks of the system it runs on: settings, folders, language. Paths are UTF-8.
+/// What the program needs from the operating system: settings, folders, language. Paths are UTF-8.
 class CPlatform
 {
 public:
     virtual ~CPlatform() = default;
 
-    /// A value of the program's own settings, section "Settings"; empty when it is absent.
+    /// Returns a value of the program's own settings, section "Settings"; empty if it is missing.
     virtual std::string ReadSetting(const std::string& key) const = 0;
-    /// False when the value could not be stored, or when this platform stores nothing.
+    /// Returns false if the value could not be stored, or if this platform stores nothing.
     virtual bool WriteSetting(const std::string& key, const std::string& value) = 0;
-    /// A read-only value of the host product, by key path and value name; empty when it is absent. The key
-    /// path is that of a registry: "Software\Maker\Product\Version".
+    /// Returns a read-only value of the host product, by key path and value name; empty if it is missing. Key
+    /// paths have the form of a registry: "Software\Maker\Product\Version".
     virtual std::string ReadHostKey(const std::string& keyPath, const std::string& valueName) const = 0;
 
-    /// The user's documents folder.
+    /// Returns the user's documents folder.
     virtual std::string DocumentsFolder() const = 0;
-    /// The folder of base.htr and the stock profiles with its trailing separator: the executable's or an
-    /// installation's, unless another was named.
+    /// Returns the folder of base.htr and the stock profiles with a trailing separator: the executable's or
+    /// an installation's, unless another one was given.
     virtual std::string DataFolder() const = 0;
-    /// Makes a folder; an existing one is no error. A platform that stores nothing makes none.
+    /// Creates a folder; succeeds if it exists. A platform that stores nothing creates none.
     virtual bool MakeFolder(const std::string& path) = 0;
 
-    /// The thread's locale by its number; the low ten bits are the primary language. 0 where it has none.
+    /// Returns the thread's locale number, whose low ten bits are the primary language; 0 without one.
     virtual uint32_t ThreadLocale() const = 0;
 };
 
-/// The folder of the user's own profiles with its trailing separator: in the host product's folder of custom
-/// data, whose key path is given, else among the user's documents.
+/// Returns the folder of the user's own profiles with a trailing separator: in the host product's folder of custom
+/// data, whose key path is given, or in the user's documents if the product is not installed.
 std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath);
 
-/// The primary language of a locale number.
+/// Returns the primary language of a locale number.
 constexpr uint32_t PrimaryLanguage(uint32_t locale)
 {
     return locale & 0x3ff;

@@ -10,16 +10,16 @@ namespace gw {
 /// The library of translated strings, in the data folder.
 inline constexpr const char* kResourceLibrary = "GaitForgeRes.dll";
 
-/// Every message's text: from the resource library where it has one, else from the program's own table.
+/// Texts of messages: from the resource library if it has one, otherwise from the program's own table.
 class CResourceManager
 {
 public:
-    /// Takes a library of translated strings; a missing or broken one is no error. The locale chooses among
-    /// the library's languages.
+    /// Opens a library of translated strings. A missing or damaged one is not an error. The locale selects
+    /// one of the library's languages.
     void OpenLibrary(const std::string& path, uint32_t locale);
 
-    /// False when no text was found or the one found begins with "*". A "*" in the library marks a text that
-    /// the translation leaves to the program's table.
+    /// Loads the text of a message. Returns false if there is none or it begins with "*". In the library, "*"
+    /// marks a text that is not translated and comes from the program's table.
     bool LoadResString(int id, std::string& text) const;
 
 private:

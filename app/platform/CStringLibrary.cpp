@@ -7,9 +7,9 @@
 #include <optional>
 #include <utility>
 
-// A string lies behind three levels of directories: type, block of sixteen ids, language. Each entry of a
-// directory points either to a further directory or to the place of the block's bytes. The levels are walked
-// one by one, so that directories that point back at themselves cannot catch the reader.
+// Strings are stored below three levels of directories: type, block of sixteen ids, language. Each directory
+// entry points either to another directory or to the block's bytes. The levels are descended one by one, so
+// directories that point back at themselves cannot cause an endless loop.
 
 namespace gw {
 
@@ -24,7 +24,7 @@ constexpr uint32_t kImageMagic = 0x4550;
 constexpr uint32_t kOptional32 = 0x10b;
 constexpr uint32_t kOptional64 = 0x20b;
 
-// Little-endian reads at any offset. Reading behind the end gives 0 and is remembered.
+// Little-endian reads at any offset. Reading past the end yields 0 and sets a flag.
 class CImage
 {
 public:
@@ -57,7 +57,7 @@ struct Headers
 {
     uint64_t m_uiSections = 0; // offset of the section table
     uint32_t m_uiSectionCount = 0;
-    uint32_t m_uiResources = 0; // relative address, as it would lie in memory
+    uint32_t m_uiResources = 0; // relative address, as if loaded in memory
 };
 
 bool ReadHeaders(CImage& image, Headers& headers)
@@ -79,7 +79,7 @@ bool ReadHeaders(CImage& image, Headers& headers)
     return image.IsSound() && headers.m_uiResources != 0;
 }
 
-// Where an address in memory lies in the file.
+// Converts a memory address to a file offset.
 std::optional<uint64_t> FileOffset(CImage& image, const Headers& headers, uint32_t address)
 {
     for (uint32_t i = 0; i < headers.m_uiSectionCount && image.IsSound(); ++i)
@@ -93,8 +93,8 @@ std::optional<uint64_t> FileOffset(CImage& image, const Headers& headers, uint32
     return std::nullopt;
 }
 
-// The target of the entry that `rank` likes best; the rank of an id is 0 when it does not fit at all. Names,
-// which come first and have the high bit, never fit.
+// Returns the target of the entry with the highest `rank`; an id that does not fit has rank 0. Named entries,
+// which come first and have the high bit set, never fit.
 template <class Rank>
 std::optional<uint32_t> FindEntry(CImage& image, uint64_t directory, Rank rank)
 {
@@ -124,7 +124,7 @@ int LanguageRank(uint32_t language, uint32_t locale)
     return language == 0 ? 2 : 1;
 }
 
-// One level down: the directory that an id names.
+// Descends one level, to the directory with an id.
 std::optional<uint64_t> Descend(CImage& image, uint64_t root, uint64_t directory, uint32_t wanted)
 {
     const auto entry = FindEntry(image, directory, [=](uint32_t id) { return id == wanted ? 1 : 0; });
@@ -184,7 +184,7 @@ std::string ReadUtf16(CImage& image, uint64_t offset, uint32_t unitCount)
     return text;
 }
 
-// The string at a place in a block: sixteen texts, each behind the count of its 16-bit units.
+// Reads a string of a block: sixteen texts, each preceded by its length in 16-bit units.
 std::optional<std::string> ReadString(CImage& image, const Block& block, uint32_t index)
 {
     uint64_t offset = block.m_uiBegin;

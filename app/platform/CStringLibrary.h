@@ -9,16 +9,16 @@
 
 namespace gw {
 
-/// Finds a string of a Windows program or library by its id, in UTF-8. Of several languages the locale's is
-/// taken, then one of the same primary language, then the neutral one, then the first. False when it is not
-/// there or the file is damaged on the way to it; nothing in the file is trusted.
+/// Finds a string of a Windows program or library by id and stores it as UTF-8. Prefers the locale's
+/// language, then the same primary language, then the neutral one, then the first. Returns false if it is not
+/// found or the file is damaged; the file is not trusted.
 bool FindResourceString(std::span<const std::byte> file, uint32_t id, uint32_t locale, std::string& text);
 
 /// The string table of a library file, which stays mapped.
 class CStringLibrary
 {
 public:
-    /// False when there is no such file; no string is found then.
+    /// Returns false if the file does not exist; then no strings are found.
     bool Open(const std::string& path);
     bool LoadString(uint32_t id, uint32_t locale, std::string& text) const;
 

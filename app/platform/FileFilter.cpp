@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// Up to the next bar, which goes too; the rest is what follows.
+// Splits off the text up to the next bar, and removes the bar.
 std::string_view NextPart(std::string_view& rest)
 {
     const size_t bar = rest.find('|');

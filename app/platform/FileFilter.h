@@ -9,12 +9,12 @@ namespace gw {
 /// One choice of a file dialog's filter.
 struct FileFilter
 {
-    std::string text;                  ///< as the user reads it
+    std::string text;                  ///< as shown to the user
     std::vector<std::string> patterns; ///< "*.bvh"
 };
 
-/// The choices of a filter as FileDialogSetup has it: pairs of text and patterns, "|" behind each; ";"
-/// stands between the patterns of one choice. An unfinished pair at the end is left out.
+/// Splits a filter in the form of FileDialogSetup: pairs of text and patterns, each followed by "|", with
+/// ";" between a choice's patterns. An incomplete last pair is ignored.
 std::vector<FileFilter> SplitFilter(std::string_view filter);
 
 } // namespace gw

@@ -6,15 +6,15 @@
 
 namespace gw {
 
-/// Identifies one state of a file without reading it: two equal stamps mean that the file is still the same
-/// one and was not written in between.
+/// Identifies one state of a file without reading it: equal stamps mean that it is the same file and was not
+/// written in between.
 struct FileStamp
 {
     uint64_t device = 0;
     uint64_t inode = 0;
     uint64_t byteCount = 0;
     int64_t modified = 0; ///< nanoseconds
-    int64_t changed = 0;  ///< nanoseconds; also set by whatever sets `modified` back
+    int64_t changed = 0;  ///< nanoseconds; also changes if `modified` is set back
 
     friend bool operator==(const FileStamp&, const FileStamp&) = default;
 };

@@ -1,3 +1,6 @@
+// The escapes of the INI dialect, as Qt reads and writes them: %XX in keys, backslashes and quotes in values.
+// Reading accepts whatever Qt accepts, since people edit these files by hand.
+
 #include "IniEscapes.h"
 
 #include "Utf8.h"
@@ -29,7 +32,7 @@ constexpr struct
     {'\\', '\\'},
 };
 
-// Reads digits of a base at a place; false, and the place left alone, where there are none.
+// Reads digits in a base at a position; returns false and leaves the position unchanged if there are none.
 bool TakeNumber(std::string_view text, size_t& place, size_t maxDigits, int base, uint32_t& number)
 {
     const char* const begin = text.data() + place;
@@ -41,7 +44,7 @@ bool TakeNumber(std::string_view text, size_t& place, size_t maxDigits, int base
     return true;
 }
 
-// Reads the escape whose backslash stands before a place. An unknown letter is passed over, as is a line end.
+// Reads the escape after a backslash. An unknown letter or a line end is skipped.
 void TakeEscape(std::string_view text, size_t& place, std::string& value)
 {
     if (place == text.size())
@@ -66,7 +69,7 @@ void TakeEscape(std::string_view text, size_t& place, std::string& value)
     place += text.substr(place).starts_with("\r\n") ? 2 : 1;
 }
 
-// "@" begins what is no plain text: "@@" stands for one, and bytes are taken as they are.
+// "@" starts a value that is not plain text: "@@" is a literal "@", and bytes are used unchanged.
 std::string WithoutMark(const std::string& value)
 {
     constexpr std::string_view kBytes = "@ByteArray(";
@@ -121,7 +124,7 @@ std::string UnescapedIniValue(std::string_view text)
 {
     std::string value;
     std::string element;
-    size_t keep = 0; // blanks at the end of an element go, unless they stood in quotes
+    size_t keep = 0; // blanks at the end of an element are removed, unless quoted
     bool quoted = false;
     const auto endElement = [&] {
         while (element.size() > keep && kIniBlanks.find(element.back()) != kIniBlanks.npos)

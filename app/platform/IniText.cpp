@@ -1,3 +1,7 @@
+// Finds and changes values in the text of a settings file without rewriting the rest, so that comments and
+// entries of other programs are preserved. A logical line can span several physical ones; Line describes its
+// extent and what would close it.
+
 #include "IniText.h"
 
 #include "IniEscapes.h"
@@ -19,22 +23,22 @@ std::string_view Trimmed(std::string_view text)
     return text.substr(begin, text.find_last_not_of(kIniBlanks) + 1 - begin);
 }
 
-// One line as the dialect sees it: quotes and backslashes carry it over line ends.
+// A logical line of the dialect, which quotes and backslashes continue past line ends.
 struct Line
 {
     size_t m_uiBegin = 0; // in the whole text
-    size_t m_uiEnd = 0;   // behind the last character, without the line end
+    size_t m_uiEnd = 0;   // after the last character, without the line end
     size_t m_uiEquals = std::string_view::npos;
-    std::string_view m_kClosing; // what it lacks where the text ends within it
+    std::string_view m_kClosing; // missing closing characters if the text ends inside it
 };
 
-// The end of a comment or of the line that a ";" cuts.
+// Returns the end of a comment, or of a line cut by ";".
 size_t EndOfPhysicalLine(std::string_view text, size_t from)
 {
     return std::min(text.find('\n', from), text.size());
 }
 
-// Finds the next line from an offset on; false at the end of the text.
+// Finds the next line at or after an offset; false at the end of the text.
 bool NextLineOf(std::string_view text, size_t from, Line& line)
 {
     line = {};
@@ -63,8 +67,7 @@ bool NextLineOf(std::string_view text, size_t from, Line& line)
     return true;
 }
 
-// Closes a line that quotes or a backslash leave open: all that is added behind would be taken for a part of
-// it.
+// Closes a last line left open by quotes or a backslash, which would otherwise swallow all appended text.
 void CloseLastLine(std::string& text)
 {
     std::string_view closing;
@@ -73,7 +76,7 @@ void CloseLastLine(std::string& text)
     text += closing;
 }
 
-// The section that a header line opens: empty for the part that has none.
+// Returns the section that a header line opens; empty for the part without one.
 std::string SectionOf(std::string_view line)
 {
     const std::string_view inside = line.substr(1, line.find(']') - 1);
@@ -83,11 +86,11 @@ std::string SectionOf(std::string_view line)
     return UnescapedIniKey(EqualNoCase(name, "%General") ? name.substr(1) : name);
 }
 
-// Where a key stands, and where a new one goes.
+// The position of a key, or where to insert it.
 struct Place
 {
     std::optional<Line> entry;
-    std::optional<size_t> sectionEnd; // behind the last line of the section
+    std::optional<size_t> sectionEnd; // after the section's last line
 };
 
 Place FindPlace(std::string_view text, std::string_view section, std::string_view key)

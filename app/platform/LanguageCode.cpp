@@ -24,7 +24,7 @@ constexpr struct
     {22, "ptg"},
 };
 
-// The longer names stand first, since a name is found by its beginning.
+// Longer names come first, because a prefix is enough for a match.
 constexpr struct
 {
     std::string_view m_kName;
@@ -43,7 +43,7 @@ constexpr struct
     {"en",    1033              },
 };
 
-// "pt" begins "pt_PT" and "pt.UTF-8", but not "pty".
+// "pt" matches "pt_PT" and "pt.UTF-8", but not "pty".
 bool Begins(std::string_view name, std::string_view beginning)
 {
     if (!EqualNoCase(name.substr(0, beginning.size()), beginning))

@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// The numbers in the order of the text.
+// The numbers in text order.
 constexpr int WindowPlacement::*kNumbers[] = {
     &WindowPlacement::flags,      &WindowPlacement::showCommand, &WindowPlacement::minimisedX,
     &WindowPlacement::minimisedY, &WindowPlacement::maximisedX,  &WindowPlacement::maximisedY,
@@ -19,7 +19,7 @@ constexpr int WindowPlacement::*kNumbers[] = {
 
 constexpr std::string_view kBlanks = " \t";
 
-// A field holds one integer, with blanks before it or not, and nothing else.
+// Reads a field that contains one integer, optionally after blanks, and nothing else.
 bool ScanField(std::string_view field, int& number)
 {
     field.remove_prefix(std::min(field.find_first_not_of(kBlanks), field.size()));

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// Where a window stood, as the settings keep it. Screen pixels.
+/// A window's position as stored in the settings, in screen pixels.
 struct WindowPlacement
 {
     int flags = 0; ///< written as 0
@@ -22,9 +22,9 @@ struct WindowPlacement
     friend bool operator==(const WindowPlacement&, const WindowPlacement&) = default;
 };
 
-/// Ten numbers with commas between them.
+/// Returns ten numbers separated by commas.
 std::string PlacementText(const WindowPlacement& placement);
-/// Returns false and leaves the placement unchanged for a text that is not exactly ten integers.
+/// Parses a placement. Returns false, and leaves it unchanged, unless the text is exactly ten integers.
 bool ScanPlacement(std::string_view text, WindowPlacement& placement);
 
 } // namespace gw

@@ -22,7 +22,7 @@ void CContentHash::Free::operator()(XXH3_state_s* state) const
     XXH3_freeState(state);
 }
 
-// The kind and the length before the bytes keep "ab", "c" and "a", "bc" apart.
+// Kind and length before the bytes distinguish "ab", "c" from "a", "bc".
 void CContentHash::AddPart(char kind, std::string_view bytes)
 {
     const std::string head = std::to_string(bytes.size()) + kind;
@@ -42,7 +42,7 @@ CContentHash& CContentHash::AddFile(const std::string& path)
     const bool isThere = file.Open(path) == EFailure::None;
     AddPart(isThere ? 'f' : 'n', file.Text());
     if (!file.IsWhole())
-        AddPart('c', {}); // which no whole file has
+        AddPart('c', {}); // cannot occur for a complete file
     return *this;
 }
 

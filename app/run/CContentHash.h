@@ -9,8 +9,8 @@ struct XXH3_state_s;
 
 namespace gw {
 
-/// A 128-bit hash (XXH3) of several texts and files in their order; which bytes belong to which counts too.
-/// It tells changes, and is no defence against somebody who forges a file.
+/// A 128-bit hash (XXH3) of several texts and files in order, including the boundaries between them. It
+/// detects changes but does not protect against forgery.
 class CContentHash
 {
 public:
@@ -20,9 +20,9 @@ public:
     CContentHash& operator=(const CContentHash&) = delete;
 
     CContentHash& AddText(std::string_view text);
-    /// The bytes of a file. One that cannot be read counts as such, and not as an empty one.
+    /// Adds the bytes of a file. An unreadable file differs from an empty one.
     CContentHash& AddFile(const std::string& path);
-    /// 32 hexadecimal digits.
+    /// Returns 32 hexadecimal digits.
     std::string Digits() const;
 
 private:
@@ -35,7 +35,7 @@ private:
     std::unique_ptr<XXH3_state_s, Free> m_spState;
 };
 
-/// The hash of a file alone, or empty where it cannot be read.
+/// Returns the hash of one file, or empty if it cannot be read.
 std::string FileDigits(const std::string& path);
 
 } // namespace gw

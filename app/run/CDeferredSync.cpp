@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-// Without an open file only everything can be synced, and errors cannot be learned.
+// Without an open file, only everything can be synced, and errors are not reported.
 bool SyncOne(int file)
 {
     if (file >= 0)

@@ -7,7 +7,7 @@
 
 namespace gw {
 
-/// Makes many files durable in one pass, where a sync of each would cost most of a run's time.
+/// Makes many files durable with one sync; syncing each would take most of a run's time.
 class CDeferredSync
 {
 public:
@@ -16,17 +16,17 @@ public:
     CDeferredSync(const CDeferredSync&) = delete;
     CDeferredSync& operator=(const CDeferredSync&) = delete;
 
-    /// Adds the file system of a file or folder. A failure to write there is reported by Sync from then on.
+    /// Adds the file system of a file or folder. Sync reports write failures from here on.
     void Add(const std::string& path);
-    /// Returns when everything on these file systems is on the disk. Answers a path on one where a write
-    /// failed since Add, or an empty text.
+    /// Waits until everything on these file systems is on disk. Returns a path on a file system where a write
+    /// has failed since Add, or an empty text.
     std::string Sync() const;
 
 private:
     struct FileSystem
     {
         std::string path;
-        int file = -1; ///< an open file there, below 0 where none could be opened
+        int file = -1; ///< an open file on it; negative if none could be opened
     };
 
     std::map<dev_t, FileSystem> m_kOpen;

@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// A handler may touch nothing else.
+// The only thing a handler may touch.
 volatile std::sig_atomic_t requests = 0;
 
 void TakeRequest(int)
@@ -20,7 +20,7 @@ CInterrupt::CInterrupt()
 {
     requests = 0;
     struct sigaction action = {};
-    action.sa_handler = TakeRequest; // without SA_RESTART: a wait returns at once
+    action.sa_handler = TakeRequest; // without SA_RESTART, so that waits return immediately
     for (size_t i = 0; i < std::size(kSignals); ++i)
     {
         sigaction(kSignals[i], nullptr, &m_kBefore[i]);

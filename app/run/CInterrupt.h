@@ -5,8 +5,8 @@
 
 namespace gw {
 
-/// While it lives, a request to end (Ctrl-C, SIGTERM, a hang-up) does not end the program but is counted. A
-/// request that the program was started to ignore stays ignored.
+/// While it exists, requests to end (Ctrl-C, SIGTERM, hang-up) do not end the program but are counted.
+/// Signals that were ignored at program start stay ignored.
 class CInterrupt
 {
 public:
@@ -15,9 +15,9 @@ public:
     CInterrupt(const CInterrupt&) = delete;
     CInterrupt& operator=(const CInterrupt&) = delete;
 
-    /// How often an end was requested.
+    /// Returns the number of requests.
     int Count() const;
-    /// For a child of the program: whoever started it tells it when to end.
+    /// Ignores such requests in a child process; its parent decides when it ends.
     static void Ignore();
 
 private:

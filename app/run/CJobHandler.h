@@ -7,41 +7,41 @@
 
 namespace gw {
 
-/// How a job ended, and what it said.
+/// How a job ended, and its output.
 struct JobEnd
 {
     enum class EKind : uint8_t
     {
-        Ran,      ///< to its end; `answer` is what it answered
-        Died,     ///< its process died; `status` is what waitpid told
-        TimedOut, ///< its process was ended, since it took longer than a job may
+        Ran,      ///< finished; `answer` is its result
+        Died,     ///< its process died; `status` is from waitpid
+        TimedOut, ///< its process was killed because the job took too long
     };
 
     EKind kind = EKind::Ran;
     uint8_t answer = 0;
     int status = 0;
-    double seconds = 0.0; ///< of work, without waiting for its turn
-    std::string output;   ///< what it printed on standard output
-    std::string words;    ///< and on standard error
-    std::string record;   ///< and what it wrote into its record
+    double seconds = 0.0; ///< time spent working, without waiting for its turn
+    std::string output;   ///< standard output
+    std::string words;    ///< standard error
+    std::string record;   ///< content of its record
 };
 
-/// What the jobs of a pool are. Jobs are numbers from 0 on.
+/// Defines the jobs of a pool, which are numbered from 0.
 class CJobHandler
 {
 public:
     virtual ~CJobHandler() = default;
 
-    /// Does a job. Runs in a worker process, which is a copy of the program as it stood when it was started:
-    /// what it changes in memory stays there. Answers a number of the handler's own.
+    /// Does a job. Runs in a worker process, a copy of the program at the time it was started, so changes in
+    /// memory stay there. Returns a number of the handler's choice.
     virtual uint8_t Run(size_t job, std::FILE* record) = 0;
-    /// A job's result lies complete under a private path and takes its place next. Runs in the worker.
+    /// Called before a job's result, complete under a private path, takes its place. Runs in the worker.
     virtual void Ready(size_t, const std::string&) {}
-    /// A job's process is gone; nobody works on it any longer. Comes at once.
+    /// Called immediately when a job's process has ended; nobody is working on it any more.
     virtual void Lost(size_t) {}
-    /// A job ended. Comes in the order of the jobs, whichever ended first. False ends the run.
+    /// Called when a job has ended, in job order, whichever ended first. Returns false to end the run.
     virtual bool Take(size_t job, const JobEnd& end) = 0;
-    /// Comes several times a second while jobs run, with the number of those that have ended.
+    /// Called several times per second while jobs run, with the number of jobs that have ended.
     virtual void Tick(size_t) {}
 };
 

@@ -1,3 +1,7 @@
+// Reads one level of JSON without building a tree. The parser sends events; a member that is itself an object
+// or array is written back to text and can be parsed in turn. Depth is limited, so memory and time are
+// proportional to the text.
+
 #include "CJsonMembers.h"
 
 #include "JsonText.h"
@@ -13,8 +17,8 @@ namespace {
 using Member = CJsonMembers::Member;
 using EKind = CJsonMembers::EKind;
 
-// Takes the events of the JSON library's parser, which itself does not recurse. Values of the outermost
-// object or array become members; deeper ones are written to the text of the member that holds them.
+// Receives the events of the JSON library's parser, which is not recursive. Values of the outermost object or
+// array become members; deeper ones are appended to the text of the member that contains them.
 class CMemberCollector
 {
 public:
@@ -68,7 +72,7 @@ public:
     std::vector<Member>&& TakeMembers() { return std::move(m_kMembers); }
 
 private:
-    // A value that stands alone is neither an object nor an array.
+    // A single value, outside any object or array.
     bool Take(Member&& member, std::string_view json)
     {
         if (m_uiDepth == 1)

@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// Our own lines of JSON nest four levels (values in reports in a list in a line).
+/// Our own JSON lines have four levels (values in reports in a list in a line).
 inline constexpr size_t kJsonDepthLimit = 16;
 
 enum class EJsonFault : uint8_t
@@ -18,9 +18,9 @@ enum class EJsonFault : uint8_t
     TooDeep, ///< nested deeper than kJsonDepthLimit
 };
 
-/// The members of a JSON object, or the elements of an array, whose keys are empty. Values that are objects
-/// or arrays themselves stay text, to be read in turn. No tree is built: dropping a tree of the JSON library
-/// takes memory, and ends the program if there is none.
+/// The members of a JSON object, or the elements of an array (with empty keys). Nested objects and arrays
+/// stay text, to be parsed in turn. No tree is built, because destroying a tree of the JSON library allocates
+/// memory, and ends the program if that fails.
 class CJsonMembers
 {
 public:
@@ -31,29 +31,29 @@ public:
         Integer, ///< from -2^63 to 2^63 - 1
         Number,  ///< any other
         Text,
-        Nested, ///< an object or array, as compact JSON in `text`
+        Nested, ///< an object or array as compact JSON in `text`
     };
     struct Member
     {
         std::string key = {};
         EKind kind = EKind::Null;
-        bool flag = false;     ///< of a Bool
-        int64_t integer = 0;   ///< of an Integer
-        double number = 0.0;   ///< of an Integer or a Number
-        std::string text = {}; ///< of a Text or of Nested
+        bool flag = false;     ///< for Bool
+        int64_t integer = 0;   ///< for Integer
+        double number = 0.0;   ///< for Integer or Number
+        std::string text = {}; ///< for Text or Nested
     };
 
-    /// Reads a whole text. If that fails, no members are kept.
+    /// Parses a whole text. If that fails, there are no members.
     EJsonFault Read(std::string_view text);
 
-    /// False for an array.
+    /// Returns false for an array.
     bool IsObject() const { return m_bObject; }
     const std::vector<Member>& Members() const { return m_kMembers; }
-    /// The last member with a key, or null.
+    /// Returns the last member with a key, or null.
     const Member* Find(std::string_view key) const;
-    /// Takes a member that is a text. False, with `text` unchanged, for any other.
+    /// Stores the value of a text member. Returns false and leaves `text` unchanged for any other.
     bool TakeText(std::string_view key, std::string& text) const;
-    /// Takes a member that is an integer from 0 to 2^63 - 1.
+    /// Stores the value of an integer member from 0 to 2^63 - 1, like TakeText.
     bool TakeCount(std::string_view key, uint64_t& count) const;
 
 private:

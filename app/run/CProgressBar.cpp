@@ -15,7 +15,7 @@ namespace {
 using namespace std::chrono_literals;
 
 constexpr auto kPeriod = 100ms;
-constexpr auto kMemory = 15s; // long enough for a calm rate, short enough to follow a change
+constexpr auto kMemory = 15s; // long enough for a steady rate, short enough to follow changes
 constexpr size_t kBarWidth = 24;
 constexpr size_t kUsualWidth = 80;
 
@@ -25,7 +25,7 @@ std::string OneDecimal(double value)
     return {digits, std::to_chars(digits, std::end(digits), value, std::chars_format::fixed, 1).ptr};
 }
 
-// "12s", "3m20s", "5h07m": two units at most.
+// "12s", "3m20s", "5h07m": at most two units.
 std::string Duration(double seconds)
 {
     const auto whole = static_cast<long long>(std::clamp(seconds, 0.0, 1e9) + 0.5);
@@ -86,7 +86,7 @@ void CProgressBar::Show(size_t done, size_t failed)
         return;
     m_kDue = now + kPeriod;
     m_bOnScreen = true;
-    // One column stays free: a full line would break.
+    // One column stays free, because a full line would wrap.
     const RunProgress progress{done, m_uiTotal, failed, Rate({now, done})};
     Write("\r\x1b[K" + ProgressLine(progress, TerminalWidth() - 1));
 }

@@ -7,32 +7,31 @@
 
 namespace gw {
 
-/// How far a run is.
+/// The progress of a run.
 struct RunProgress
 {
     size_t done = 0;
     size_t total = 0;
     size_t failed = 0;
-    double perSecond = 0.0; ///< lately; 0 while nobody knows
+    double perSecond = 0.0; ///< recent rate; 0 if unknown
 };
 
-/// "[=====>    ] 512/1000  48.2/s  10s left, 3 failed", cut to a width in characters.
+/// Returns "[=====>    ] 512/1000  48.2/s  10s left, 3 failed", cut to a width in characters.
 std::string ProgressLine(const RunProgress& progress, size_t width);
 
-/// A line on the terminal of standard error that shows how far a run is. Where standard error is none,
-/// nothing is shown.
+/// A progress line on the terminal of standard error. Without a terminal, nothing is shown.
 class CProgressBar
 {
 public:
-    /// How many there are to do. Nothing is shown either unless it is wanted.
+    /// `total` is the number of jobs. Shows nothing unless `wanted`.
     CProgressBar(size_t total, bool wanted);
     ~CProgressBar() { Clear(); }
     CProgressBar(const CProgressBar&) = delete;
     CProgressBar& operator=(const CProgressBar&) = delete;
 
-    /// Draws the line again, if that is due.
+    /// Redraws the line if it is due.
     void Show(size_t done, size_t failed);
-    /// Takes the line off the terminal, so that other words can be written.
+    /// Removes the line, so that other text can be written.
     void Clear();
 
 private:
@@ -49,7 +48,7 @@ private:
     bool m_bShown;
     bool m_bOnScreen = false;
     Clock::time_point m_kDue;
-    std::deque<Sample> m_kSamples; ///< of the last seconds, the oldest first
+    std::deque<Sample> m_kSamples; ///< of the last seconds, oldest first
 };
 
 } // namespace gw

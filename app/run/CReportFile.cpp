@@ -11,7 +11,7 @@
 
 namespace gw {
 
-// A plan, a state and what other commands print with --json are lines of JSON too.
+// Plans, states and the output of other commands with --json are JSON lines too.
 bool CReportFile::IsReport(const std::string& path)
 {
     CMappedFile file;
@@ -33,7 +33,7 @@ bool CReportFile::Open(const std::string& path, EStart start)
 {
     if (m_iFile >= 0)
         close(std::exchange(m_iFile, -1));
-    // Read too, to see how the file ends.
+    // Readable too, to check how the file ends.
     const int cut = start == EStart::Empty ? O_TRUNC : 0;
     m_iFile = open(path.c_str(), O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC | cut, 0666);
     m_bFailed = m_iFile < 0;

@@ -5,19 +5,19 @@
 
 namespace gw {
 
-/// A text file that grows by whole lines. Each goes out at once and in one piece, so that the file of a
-/// program that was killed holds all lines up to then.
+/// A text file that grows by whole lines. Each line is written immediately and in one piece, so the file of a
+/// killed program contains all lines up to then.
 class CReportFile
 {
 public:
     enum class EStart : bool
     {
         Empty,
-        AtEnd, ///< behind what is there; half a line of a writer that died is closed first
+        AtEnd, ///< after existing lines; an incomplete last line is ended first
     };
 
-    /// Whether a file is empty or begins as a report does: with a line about a source and what became of it.
-    /// False for a file that cannot be read.
+    /// Returns whether a file is empty or starts like a report, with a line about a source and its result.
+    /// False if it cannot be read.
     static bool IsReport(const std::string& path);
 
     CReportFile() = default;
@@ -25,10 +25,10 @@ public:
     CReportFile(const CReportFile&) = delete;
     CReportFile& operator=(const CReportFile&) = delete;
 
-    /// False when the file cannot be written.
+    /// Returns false if the file cannot be written.
     bool Open(const std::string& path, EStart start);
     bool IsOpen() const { return m_iFile >= 0; }
-    /// False, now and from then on, when the file system does not take it.
+    /// Returns false, now and from then on, if a line cannot be written.
     bool AddLine(std::string_view line);
 
 private:

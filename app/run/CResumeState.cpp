@@ -1,3 +1,6 @@
+// Keeps the state of a run as lines of JSON that are only appended. A crash can cut the last line or lose
+// lines, but cannot change earlier ones; CResumeState.h has the rules that make this safe.
+
 #include "CResumeState.h"
 
 #include "CJsonMembers.h"
@@ -16,9 +19,10 @@ namespace {
 
 constexpr std::string_view kPrefix = ".gaitwright.resume.";
 constexpr std::string_view kExtension = ".jsonl";
-constexpr std::string_view kSynced = R"({"synced":true})"; // no text in JSON can contain it
+// JSON strings cannot contain this text, because they escape quotes
+constexpr std::string_view kSynced = R"({"synced":true})";
 
-// A name as the state knows it: JSON, which keeps no bytes that are no UTF-8.
+// Returns a name as stored in JSON, which cannot hold bytes that are not UTF-8.
 std::string Kept(const std::string& output)
 {
     return JsonString(output);
@@ -65,7 +69,7 @@ void CResumeState::TakeLine(std::string_view line, bool isSynced)
         return;
     if (!json.TakeText("key", entry.key) || !json.TakeText("told", entry.told))
         entry.key.clear();
-    // Earlier versions synced each result before its line.
+    // Earlier versions synced each result before writing its line.
     if (!isSynced && json.TakeText("modified", entry.modified))
         m_bUnsynced = true;
     made.push_back(std::move(entry));

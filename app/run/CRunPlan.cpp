@@ -16,7 +16,7 @@ namespace gw {
 namespace {
 
 constexpr uint64_t kPlanVersion = 1;
-// What a file costs beside its bytes (opening, syncing, the skeleton), in bytes that take as long.
+// The fixed cost of a file (opening, syncing, the skeleton), as an equivalent number of bytes.
 constexpr uint64_t kFileCost = 16'384;
 constexpr size_t kShardLimit = 1'000'000;
 
@@ -49,8 +49,8 @@ bool TakeEntry(const CJsonMembers& json, CRunPlan& plan)
 
 } // namespace
 
-// The largest first, each to the shard that has least: no shard gets more than a third above the best
-// division (Graham 1969).
+// Largest first, each to the shard with the least work: no shard gets more than a third above the optimum
+// (Graham 1969).
 void CRunPlan::Share()
 {
     using Load = std::pair<uint64_t, size_t>; // work, shard

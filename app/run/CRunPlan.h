@@ -7,8 +7,8 @@
 
 namespace gw {
 
-/// A run that several machines share, as a file of lines of JSON: the first says how to convert, every other
-/// one is a source with its output and the number of its shard, from 0 on.
+/// A run shared by several machines, as a file of JSON lines: the first contains the conversion options, each
+/// other line a source, its output and its shard number, starting at 0.
 struct CRunPlan
 {
     struct Entry
@@ -19,31 +19,31 @@ struct CRunPlan
         size_t shard = 0;
     };
 
-    std::string version;      ///< of the program that made it
-    std::string outputFolder; ///< where results and what is known of them go; empty for beside the sources
-    std::string options;      ///< a JSON object, whoever runs the plan reads it
+    std::string version;      ///< of the program that wrote it
+    std::string outputFolder; ///< for results and their state; empty for next to the sources
+    std::string options;      ///< a JSON object, read by the program that runs the plan
     size_t shardCount = 1;
     std::vector<Entry> entries;
 
-    /// Gives every entry a shard, so that all shards are about equally much work.
+    /// Assigns every entry to a shard, so that all shards take about the same work.
     void Share();
-    /// The entries of one shard, in the order of the plan.
+    /// Returns the entries of one shard, in plan order.
     std::vector<Entry> Shard(size_t shard) const;
 };
 
-/// Writes a plan in one step. False when the file cannot be written.
+/// Writes a plan atomically. Returns false if the file cannot be written.
 bool WritePlan(const std::string& path, const CRunPlan& plan);
 
 enum class EPlanFault : uint8_t
 {
     None,
-    Unreadable, ///< there is no such file
-    NoPlan,     ///< its first line is none of a plan
-    BadLine,    ///< another line is none, or names a shard that there is not
-    TooDeep,    ///< a line is nested deeper than any plan
+    Unreadable, ///< the file does not exist
+    NoPlan,     ///< the first line is not that of a plan
+    BadLine,    ///< another line is invalid, or names a shard that does not exist
+    TooDeep,    ///< a line is nested deeper than a plan's
 };
 
-/// Reads a plan. `line` becomes the one that was refused, from 1 on.
+/// Reads a plan. If a line is refused, `line` is its number, starting at 1.
 EPlanFault ReadPlan(const std::string& path, CRunPlan& plan, size_t& line);
 
 } // namespace gw

@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-// False when the program is gone or wants no more.
+// Returns false if the program has ended or has no more jobs.
 bool Receive(int socket, WorkerOrder& order)
 {
     ssize_t count = 0;

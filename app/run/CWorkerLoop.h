@@ -6,14 +6,15 @@
 
 namespace gw {
 
-/// When the results of jobs may take the place of what was there.
+/// When the results of jobs may replace existing files.
 enum class ECommit : uint8_t
 {
     AtOnce,
-    InTurn, ///< when all earlier jobs have ended well, so that a run that ends leaves what one by one leaves
+    /// after all earlier jobs have succeeded, so that an aborted run leaves what a sequential run would leave
+    InTurn,
 };
 
-/// A worker's side of the pool: does the jobs that it is given until its socket is closed.
+/// The worker's side of the pool: does the jobs it receives until its socket is closed.
 class CWorkerLoop
 {
 public:
@@ -32,7 +33,7 @@ private:
     ECommit m_eCommit;
     size_t m_uiJob = 0;
     Clock::duration m_kWaited{};
-    bool m_bMayCommit = false; ///< this job, from here on
+    bool m_bMayCommit = false; ///< for the rest of this job
 };
 
 } // namespace gw

@@ -1,9 +1,13 @@
-// Jobs go out in their order to whichever process is free, ends come back in any, and are taken in order.
+// Runs jobs in worker processes. Jobs are given out in order to whichever process is free, end in any order,
+// and their results are taken in job order.
 //
-// A run that ends with its first failure must leave what it leaves when the jobs are done one by one, however
-// many processes work ahead. So each asks before its file takes its place, and gets leave when all earlier
-// jobs have ended well. While it waits it needs no core: another process is started in its stead, up to a
-// bound.
+// With ECommit::InTurn, a run that stops at its first failure must leave exactly the files that a sequential
+// run would leave, however many processes work ahead. So a worker with a finished result asks before its file
+// takes its place, and gets permission when all earlier jobs have succeeded. While it waits it uses no core,
+// so another process is started in its place, up to kAhead per core.
+//
+// This cannot deadlock: the earliest unfinished job never waits for another one, and a job that hangs is
+// killed after its time limit.
 
 #include "CWorkerPool.h"
 
@@ -20,9 +24,9 @@ namespace {
 
 using EState = CWorkerProcess::EState;
 
-constexpr size_t kAhead = 4;               // processes for each that works, those that wait included
-constexpr int kTickMilliseconds = 100;     // at the latest
-constexpr std::chrono::seconds kGrace(10); // for what is under way when the run is to end
+constexpr size_t kAhead = 4;               // processes per active one, including those that wait
+constexpr int kTickMilliseconds = 100;     // maximum time between ticks
+constexpr std::chrono::seconds kGrace(10); // for running jobs when the run must end
 
 } // namespace
 
@@ -95,7 +99,7 @@ void CWorkerPool::GiveJobs(size_t jobCount)
     }
 }
 
-// The one whose turn it is; what it does then no longer depends on any other.
+// The worker whose turn it is; from here on, its result does not depend on any other.
 void CWorkerPool::OpenGate()
 {
     for (const auto& worker : m_kWorkers)
@@ -137,7 +141,7 @@ void CWorkerPool::KillLate()
     ForgetGone();
 }
 
-// Their jobs count as not begun.
+// Their jobs count as not started.
 void CWorkerPool::AbandonRunning()
 {
     for (const auto& worker : m_kWorkers)
@@ -172,14 +176,14 @@ void CWorkerPool::TakeEnds()
     }
 }
 
-// What ended behind a job that was abandoned.
+// Takes the ends of jobs after an abandoned one.
 void CWorkerPool::TakeRest()
 {
     for (auto end = m_kEnded.begin(); !m_bRefused && end != m_kEnded.end(); ++end)
         m_bRefused = !handler_.Take(end->first, end->second);
 }
 
-// All are told before any is waited for.
+// Closes all processes before waiting for any.
 void CWorkerPool::Dismiss()
 {
     for (const auto& worker : m_kWorkers)

@@ -13,13 +13,13 @@ class CInterrupt;
 
 struct PoolSettings
 {
-    size_t workerCount = 1;    ///< processes that work at a time
-    double jobSeconds = 600.0; ///< a job that takes longer is given up
+    size_t workerCount = 1;    ///< number of processes that work at the same time
+    double jobSeconds = 600.0; ///< time limit of a job
     ECommit commit = ECommit::AtOnce;
 };
 
-/// Has jobs done by worker processes, each many of them. A job that crashes or hangs costs its process and
-/// nothing else: the next one is done by a new process.
+/// Runs jobs in worker processes, each of which does many. A job that crashes or hangs only costs its
+/// process; the next job gets a new one.
 class CWorkerPool
 {
 public:
@@ -27,9 +27,9 @@ public:
     CWorkerPool(CJobHandler& handler, const PoolSettings& settings);
     ~CWorkerPool();
 
-    /// Does the jobs below a number. Ends when all have ended, when the handler refuses one, or when an end
-    /// is requested: then what is under way is finished first, unless it takes long or the request is
-    /// repeated. False when the system gave no process to go on with.
+    /// Runs the jobs below a number. Ends when all have ended, when the handler refuses one, or when an
+    /// interrupt is requested; running jobs are then finished, unless they take long or the request is
+    /// repeated. Returns false if the system could not start a process to continue with.
     bool Run(size_t jobCount, const CInterrupt& interrupt);
 
 private:
@@ -54,11 +54,11 @@ private:
     CJobHandler& handler_;
     PoolSettings m_kSettings;
     Workers m_kWorkers;
-    std::map<size_t, JobEnd> m_kEnded;        ///< that wait for an earlier one
-    size_t m_uiNext = 0;                      ///< job to be given out
-    size_t m_uiTaken = 0;                     ///< number of jobs whose ends were taken, from the first on
-    bool m_bRefused = false;                  ///< by the handler
-    std::optional<Clock::time_point> ending_; ///< since when the run is to end
+    std::map<size_t, JobEnd> m_kEnded;        ///< waiting for an earlier one
+    size_t m_uiNext = 0;                      ///< next job to give out
+    size_t m_uiTaken = 0;                     ///< number of jobs whose ends were taken, from the first
+    bool m_bRefused = false;                  ///< the handler ended the run
+    std::optional<Clock::time_point> ending_; ///< when the run began to end
 };
 
 } // namespace gw

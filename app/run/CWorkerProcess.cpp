@@ -1,3 +1,7 @@
+// The parent's side of a worker process: fork, socket, and the collection of its output. A worker writes to
+// files in memory rather than pipes, so it can never block on a full pipe, and its last output survives its
+// death.
+
 #include "CWorkerProcess.h"
 
 #include "CInterrupt.h"
@@ -22,7 +26,7 @@ namespace {
 
 using namespace std::chrono_literals;
 
-constexpr auto kPatience = 5s; // with a process that was told to end
+constexpr auto kPatience = 5s; // to wait for a process that was asked to end
 constexpr auto kGlance = 2ms;
 
 void CloseFile(int& file)
@@ -31,7 +35,8 @@ void CloseFile(int& file)
         close(std::exchange(file, -1));
 }
 
-// A file in memory. What is written goes to its end, also after it was emptied by somebody else.
+// Creates a file in memory, opened for appending, so that writes go to its end even after somebody else has
+// emptied it.
 int CreateMemory(const char* name)
 {
     const int file = memfd_create(name, MFD_CLOEXEC);
@@ -40,7 +45,7 @@ int CreateMemory(const char* name)
     return file;
 }
 
-// Takes out what was written.
+// Removes and returns the text.
 std::string TakeText(int file)
 {
     struct stat status = {};
@@ -51,7 +56,7 @@ std::string TakeText(int file)
     const ssize_t count = pread(file, text.data(), text.size(), 0);
     text.resize(static_cast<size_t>(std::max<ssize_t>(count, 0)));
     if (ftruncate(file, 0) != 0)
-        text.clear(); // rather than to tell it twice
+        text.clear(); // otherwise it would be reported twice
     return text;
 }
 
@@ -74,7 +79,7 @@ std::unique_ptr<CWorkerProcess> CWorkerProcess::Start(CJobHandler& handler, ECom
     if (!worker->Open() || socketpair(AF_UNIX, SOCK_SEQPACKET | SOCK_CLOEXEC, 0, ends) != 0)
         return nullptr;
     worker->m_iSocket = ends[0];
-    std::fflush(nullptr); // or the copy would print it again
+    std::fflush(nullptr); // otherwise the child would print it again
     worker->m_iProcess = fork();
     if (worker->m_iProcess == 0)
     {
@@ -101,7 +106,7 @@ void CWorkerProcess::Serve(CJobHandler& handler, ECommit commit, int socket)
     std::FILE* const record = fdopen(m_iRecord, "a");
     if (record && dup2(m_iOutput, STDOUT_FILENO) >= 0 && dup2(m_iWords, STDERR_FILENO) >= 0)
         CWorkerLoop(handler, socket, record, commit).Run();
-    _exit(0); // nothing of the program's own end is the copy's to do
+    _exit(0); // skips the program's own cleanup in the child
 }
 
 CWorkerProcess::~CWorkerProcess()
@@ -134,7 +139,7 @@ void CWorkerProcess::LetCommit()
     Send(m_uiJob);
 }
 
-// A process that is gone takes nothing; the next look at its socket tells.
+// If the process is gone, sending fails silently; the next read of its socket shows it.
 void CWorkerProcess::Send(size_t job)
 {
     const WorkerOrder order{job};

@@ -11,8 +11,8 @@ namespace gw {
 
 struct WorkerReply;
 
-/// A process that does jobs, as the program sees it. What the process prints goes to files in memory, which
-/// outlive it: the last words of one that died are told too.
+/// A worker process, seen from the program. Its output goes to files in memory that outlive it, so the last
+/// output of a process that died is reported too.
 class CWorkerProcess
 {
 public:
@@ -20,16 +20,16 @@ public:
     {
         Idle,
         Running,
-        Waiting, ///< with a finished result, for its turn
+        Waiting, ///< waiting for its turn, with a finished result
         Gone,
     };
 
-    /// Starts a process. The sockets of those that run already are closed in it, or they would not notice the
-    /// end of the program. Null where the system gives none.
+    /// Starts a process. Closes the sockets of the other workers in it; otherwise they would not notice the
+    /// end of the program. Returns null if the system cannot start one.
     static std::unique_ptr<CWorkerProcess> Start(CJobHandler& handler, ECommit commit,
                                                  std::span<const int> otherSockets);
-    /// Waits for the process, which ends by itself when its socket is closed; one that does not within some
-    /// seconds is killed.
+    /// Waits for the process, which ends when its socket is closed; kills it if that takes more than some
+    /// seconds.
     ~CWorkerProcess();
     CWorkerProcess(const CWorkerProcess&) = delete;
     CWorkerProcess& operator=(const CWorkerProcess&) = delete;
@@ -37,17 +37,17 @@ public:
     EState State() const { return m_eState; }
     size_t Job() const { return m_uiJob; }
     int Socket() const { return m_iSocket; }
-    /// Seconds since it was given its job or its turn.
+    /// Returns the seconds since it got its job or its turn.
     double RunningSeconds() const;
 
     void Give(size_t job);
     void LetCommit();
-    /// Takes what the process sends: then it waits for its turn, or its job has ended, or it is gone. `end`
-    /// is filled when its job has ended; false when it has not.
+    /// Handles what the process sends: it waits for its turn, its job has ended, or it has died. Returns true
+    /// and fills `end` if its job has ended.
     bool Receive(JobEnd& end);
-    /// Ends the process at once, and its job with it.
+    /// Kills the process and ends its job.
     void Kill(JobEnd& end);
-    /// Tells the process that there is no more to do. It may still have to end.
+    /// Tells the process that there are no more jobs. It may take a moment to end.
     void Close();
 
 private:

@@ -45,7 +45,7 @@ public:
             m_kSeen.insert(identity);
     }
 
-    // Takes a folder below the root, which ends in a separator, or the root itself.
+    // Adds the files of a folder below the root (with trailing separator), or of the root itself.
     void Take(const std::string& below);
 
     SourceFolder tree;
@@ -86,8 +86,8 @@ void CWalk::Take(const std::string& below)
     }
 }
 
-// A link back into the tree names a folder that has its place there, and one to what lies above would bring
-// in what nobody asked for.
+// A link into the tree leads to a folder that is visited anyway, and one to a parent would add files that
+// nobody asked for.
 bool CWalk::MayEnter(const fs::directory_entry& entry)
 {
     std::error_code error;

@@ -7,17 +7,17 @@
 
 namespace gw {
 
-/// The files that a walk through a folder found.
+/// The files found below a folder.
 struct SourceFolder
 {
-    std::vector<std::string> files;      ///< below the folder: "b/walk.bvh"
-    std::vector<std::string> unreadable; ///< folders below it that could not be read
+    std::vector<std::string> files;      ///< relative to the folder: "b/walk.bvh"
+    std::vector<std::string> unreadable; ///< subfolders that could not be read
 };
 
-/// All regular files below a folder whose extension is one of some, dots included and without regard to case.
-/// Of each folder first its own files, by extension and then by name, then its folders by name. Every folder
-/// is taken once, wherever links lead; one is left out with all below it, unless it is the walked one itself:
-/// where the results go.
+/// Returns all regular files below a folder with one of these extensions (dots included, case ignored). Each
+/// folder's own files come first, by extension and then by name, followed by its subfolders by name. Every
+/// folder is visited once, whatever links exist. One folder, where the results go, is skipped with its
+/// subtree, unless it is the root.
 SourceFolder WalkFolder(const std::string& folder, std::span<const std::string_view> extensions,
                         const std::string& leftOut);
 

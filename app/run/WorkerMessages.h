@@ -4,17 +4,17 @@
 
 namespace gw {
 
-/// From the program to a worker: do this job, or, to a worker that asks, you may replace its file. A closed
-/// socket means no, and no further job.
+/// Sent to a worker: do this job or, if the worker has asked, replace its file. A closed socket means no, and
+/// no further jobs.
 struct WorkerOrder
 {
     uint64_t job = 0;
 };
 
-/// From a worker to the program.
+/// Sent by a worker.
 struct WorkerReply
 {
-    bool asks = false; ///< whether it may replace a file; else the job is done
+    bool asks = false; ///< asks to replace a file; otherwise the job is done
     uint8_t answer = 0;
     double seconds = 0.0;
 };

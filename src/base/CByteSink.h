@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// Where written bytes go. The answer is false when they could not be taken.
+/// Receives written bytes. Returns false if they could not be stored.
 using CByteSink = std::function<bool(std::span<const std::byte>)>;
 
 } // namespace gw

@@ -15,12 +15,13 @@ namespace gw {
 
 namespace {
 
-// Up to here reading takes no longer than mapping and its page faults, and cannot be disturbed later.
+// Up to this size, reading is as fast as mapping with its page faults, and other programs cannot disturb it
+// later.
 constexpr size_t kReadBytes = size_t{1} << 20;
 
 void* PageAddress(const std::byte* bytes)
 {
-    return const_cast<std::byte*>(bytes); // the system's calls take no pointer to const
+    return const_cast<std::byte*>(bytes); // system calls take a pointer to non-const
 }
 
 } // namespace
@@ -50,7 +51,7 @@ CMappedFile& CMappedFile::operator=(CMappedFile&& other) noexcept
 EFailure CMappedFile::Open(const std::string& path)
 {
     Close();
-    // Without O_NONBLOCK a named pipe would wait for a writer before it can be refused.
+    // Without O_NONBLOCK, opening a named pipe would wait for a writer before it can be refused.
     const int file = open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (file < 0)
         return EFailure::NotFound;
@@ -96,7 +97,7 @@ EFailure CMappedFile::Map(int file, size_t size)
     if (mapped == MAP_FAILED)
         return errno == ENOMEM ? EFailure::OutOfMemory : EFailure::ReadError;
     m_pkRange = Watch(mapped, size);
-    if (!m_pkRange) // more files at a time than any program here maps
+    if (!m_pkRange) // more mapped files at a time than any program here needs
     {
         munmap(mapped, size);
         return Read(file, size);
@@ -109,7 +110,7 @@ EFailure CMappedFile::Map(int file, size_t size)
     return EFailure::None;
 }
 
-// A file that is cut inside its last page raises no signal.
+// A file that is truncated within its last page raises no signal, so its size is compared too.
 bool CMappedFile::IsWhole() const
 {
     if (!IsMapped())

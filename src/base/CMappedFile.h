@@ -12,9 +12,9 @@ namespace gw {
 
 struct WatchedRange;
 
-/// The bytes of a regular file, mapped and not copied; a small one is read, which costs less. Folders and
-/// devices are refused. An empty file maps to no bytes. Bytes that a file loses while it is mapped read as
-/// zeros; see IsWhole.
+/// The bytes of a regular file. Large files are mapped, small ones are read, which is cheaper. Folders and
+/// devices are refused. An empty file has no bytes. If the file is truncated while it is mapped, the missing
+/// bytes read as zeros; see IsWhole.
 class CMappedFile
 {
 public:
@@ -25,17 +25,18 @@ public:
     CMappedFile(const CMappedFile&) = delete;
     CMappedFile& operator=(const CMappedFile&) = delete;
 
-    /// Replaces what was mapped. None on success, else why not; nothing is mapped then.
+    /// Opens a file in place of the current one. Returns EFailure::None on success. After a failure, no file
+    /// is open.
     EFailure Open(const std::string& path);
     void Close();
 
-    /// Whether the file still had all its bytes when they were read. To be asked after the last read: what
-    /// was read of a file that was cut short meanwhile is worth nothing. True when nothing is open.
+    /// Returns whether the file still had all its bytes when they were read. Call it after the last read: if
+    /// it returns false, discard what was read. True if no file is open.
     bool IsWhole() const;
 
     std::span<const std::byte> Bytes() const { return {m_pkBytes, m_uiSize}; }
     std::string_view Text() const { return {reinterpret_cast<const char*>(m_pkBytes), m_uiSize}; }
-    /// Gives back the pages before an offset that will not be read again; they are read anew if they are.
+    /// Releases the pages before an offset. They are loaded again if they are read again.
     void Forget(size_t endOffset);
 
 private:
@@ -44,11 +45,11 @@ private:
     EFailure Map(int file, size_t size);
     bool IsMapped() const { return m_pkBytes && !m_spkSmall; }
 
-    std::unique_ptr<std::byte[]> m_spkSmall; // where the bytes are not mapped
+    std::unique_ptr<std::byte[]> m_spkSmall; // the bytes, if they are not mapped
     const std::byte* m_pkBytes = nullptr;
     size_t m_uiSize = 0;
-    int m_iFile = -1;                  // of a mapping
-    WatchedRange* m_pkRange = nullptr; // likewise
+    int m_iFile = -1;                  // set if the file is mapped
+    WatchedRange* m_pkRange = nullptr; // set if the file is mapped
 };
 
 } // namespace gw

@@ -51,13 +51,14 @@ CPrivateFile::~CPrivateFile()
 
 bool CPrivateFile::Create(const std::string& folder, std::string_view extension, unsigned mode)
 {
-    constexpr int kAttempts = 16; // a second one is almost unheard of
+    constexpr int kAttempts = 16; // even a second attempt is extremely rare
     Remove();
     SweepOnce(folder);
     for (int i = 0; i < kAttempts; ++i)
     {
         m_kPath = PrivateName(folder, extension);
-        m_iLiveName = AddLiveName(m_kPath); // before the file exists, or a signal could come in between
+        // before the file exists, because a signal could arrive in between
+        m_iLiveName = AddLiveName(m_kPath);
         m_iFile = open(m_kPath.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, mode);
         const bool isTaken = m_iFile < 0 && errno == EEXIST;
         if (m_iFile >= 0 && LockNewFile(m_iFile))
@@ -77,7 +78,7 @@ bool CPrivateFile::Write(std::string_view text)
 
 void CPrivateFile::Remove()
 {
-    // While it is locked, or another program might do the same.
+    // Deleted while it is still locked; otherwise another program could delete it at the same time.
     if (m_iFile >= 0)
         unlink(m_kPath.c_str());
     Release();

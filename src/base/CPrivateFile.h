@@ -6,41 +6,42 @@
 
 namespace gw {
 
-/// A file with a private name in some folder, for what is being written or is needed for a moment only. It is
-/// removed with the object, and when a signal ends the program (RemovePrivateFilesOnSignals). While the
-/// object lives the file is locked, so that no other program takes it for a leftover (PrivateNames.cpp).
+/// A temporary file with a private name in a given folder. It is deleted with the object, and also when a
+/// signal ends the program (RemovePrivateFilesOnSignals). While the object exists the file is locked, so that
+/// no other program deletes it as a leftover (see PrivateNames.cpp).
 class CPrivateFile
 {
 public:
     CPrivateFile() = default;
-    /// Creates an empty file beside a path that only the user may read; see Path for success.
+    /// Creates an empty file, readable only by the user, in the folder of a path. Path is empty if that
+    /// fails.
     CPrivateFile(const std::string& besidePath, std::string_view extension);
     ~CPrivateFile();
     CPrivateFile(const CPrivateFile&) = delete;
     CPrivateFile& operator=(const CPrivateFile&) = delete;
 
     /// Replaces the file by a new, empty one in a folder that ends in a separator, with an extension (dot
-    /// included) and a mode (less the user's mask). False when the folder does not accept it.
+    /// included) and a mode (minus the user's umask). Returns false if the file cannot be created.
     bool Create(const std::string& folder, std::string_view extension, unsigned mode);
-    /// Replaces the content; false when the file system does not take it.
+    /// Replaces the content; false if it cannot be written.
     bool Write(std::string_view text);
     /// Closes and deletes the file.
     void Remove();
-    /// Closes the file without deleting it: it has been renamed.
+    /// Closes the file without deleting it, because it has been renamed.
     void Release();
 
-    /// Empty when there is no file.
+    /// Returns the path, or an empty text without a file.
     const std::string& Path() const { return m_kPath; }
-    /// The descriptor, open for reading and writing; below 0 when there is no file.
+    /// Returns the descriptor, open for reading and writing, or a negative number without a file.
     int File() const { return m_iFile; }
 
 private:
     std::string m_kPath;
     int m_iFile = -1;
-    int m_iLiveName = -1; // see LiveNames
+    int m_iLiveName = -1; // number of the path in LiveNames
 };
 
-/// Writes all bytes at a descriptor's position, or at an offset; false when the file system fails.
+/// Writes all bytes at the descriptor's position or at an offset; false if writing fails.
 bool WriteAll(int file, std::string_view text);
 bool WriteAllAt(int file, std::string_view text, uint64_t offset);
 

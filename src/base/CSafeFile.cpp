@@ -17,17 +17,18 @@ namespace gw {
 
 namespace {
 
-constexpr unsigned kModeOfNew = 0666; // less the user's mask, as for any new file
+constexpr unsigned kModeOfNew = 0666; // minus the user's umask, as for any new file
 constexpr unsigned kModeWhileReplacing = 0600;
-constexpr unsigned kPermissions = 0777; // a set-id bit was granted to the old content
+constexpr unsigned kPermissions = 0777; // set-id bits were granted to the old content only
 constexpr unsigned kGroupBits = 070;
-// Not the destination's, so that nobody who lists a folder by extension finds a half-written file.
+// Not the destination's extension, so that a program that lists files by extension never sees a half-written
+// one.
 constexpr std::string_view kPrivateExtension = ".tmp";
 
-// Where a chain of symbolic links leads, be there a file or not. Empty for a ring.
+// Returns the end of a chain of symbolic links, whether or not a file exists there. Empty for a cycle.
 std::string FollowLinks(const std::string& path)
 {
-    constexpr int kLinkLimit = 40; // the system's own
+    constexpr int kLinkLimit = 40; // the system's limit
     std::filesystem::path target(path);
     for (int i = 0; i < kLinkLimit; ++i)
     {
@@ -52,7 +53,8 @@ std::set<std::string>& KeptPaths()
     return paths;
 }
 
-// Claims a free name with an empty file, for file systems that have no links. A crash can leave that behind.
+// Claims a free name with an empty file, for file systems without hard links. A crash can leave that file
+// behind.
 bool RenameToClaimed(const char* from, const char* to)
 {
     const int file = open(to, O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kModeWhileReplacing);
@@ -65,8 +67,8 @@ bool RenameToClaimed(const char* from, const char* to)
     return false;
 }
 
-// Renames without replacing anything; EEXIST when there is something. The first call is missing on NFS and
-// some others, the second on FAT.
+// Renames without replacing anything; fails with EEXIST if the destination exists. NFS and some others lack
+// the first call, FAT lacks the second.
 bool RenameToFree(const char* from, const char* to)
 {
     if (renameat2(AT_FDCWD, from, AT_FDCWD, to, RENAME_NOREPLACE) == 0)
@@ -115,14 +117,15 @@ bool CSafeFile::Open(const std::string& path)
     const std::string folder = FolderOf(m_kPath);
     if (m_kPath == folder || !MayReplace())
         return false;
-    // What others may not read is not laid open while it is written: the old permissions come with Commit.
+    // A file that others may not read stays unreadable while it is being written. Commit restores the old
+    // permissions.
     if (!m_kPrivate.Create(folder, kPrivateExtension, m_uiMode ? kModeWhileReplacing : kModeOfNew))
         return false;
     m_eFailure = EFailure::None;
     return true;
 }
 
-// Whether the path is free or holds a file that may be replaced, and as what.
+// Checks that the path is free or holds a file that may be replaced, and records its mode and group.
 bool CSafeFile::MayReplace()
 {
     struct stat status;
@@ -164,7 +167,8 @@ bool CSafeFile::Commit()
     return good;
 }
 
-// A group that the user may not give the file to must not lend its permissions to another group either.
+// If the user may not assign the file to its old group, the new group must not get the old group's
+// permissions.
 bool CSafeFile::KeepOwnership()
 {
     if (m_uiMode == 0)
@@ -178,13 +182,13 @@ bool CSafeFile::KeepOwnership()
     return fchmod(m_kPrivate.File(), mode) == 0;
 }
 
-// Some file systems report only at a close what they could not write. The lock, and with it the name, stays
-// with the other descriptor.
+// Some file systems report write errors only on close. The lock, and with it the name, stays with the other
+// descriptor.
 bool CSafeFile::Sync() const
 {
     const int file = m_kPrivate.File();
     const bool isLater = ms_bSyncsDeferred && m_uiMode == 0;
-    if (isLater) // the disk begins now, so that little is left for the sync of all
+    if (isLater) // starts writing to disk now, so the later sync of all files has less to do
         sync_file_range(file, 0, 0, SYNC_FILE_RANGE_WRITE);
     if ((!isLater && fsync(file) != 0) || (ms_kCommitGate && !ms_kCommitGate(m_kPrivate.Path())))
         return false;

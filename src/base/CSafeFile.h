@@ -12,10 +12,10 @@
 
 namespace gw {
 
-/// Replaces a file in one step: bytes go to a private file in the same folder, and Commit renames it over the
-/// destination. Without a Commit, or when anything failed, the old file stays as it was and the private one
-/// is removed. A symbolic link is followed. A file that is replaced keeps its group and its permissions, but
-/// not its set-id bits.
+/// Replaces a file atomically: bytes go to a private file in the same folder, and Commit renames it over the
+/// destination. Without a Commit, or after a failure, the old file is unchanged and the private one is
+/// deleted. Symbolic links are followed. A replaced file keeps its group and permissions, but not its set-id
+/// bits.
 class CSafeFile
 {
 public:
@@ -24,32 +24,34 @@ public:
     CSafeFile(const CSafeFile&) = delete;
     CSafeFile& operator=(const CSafeFile&) = delete;
 
-    /// Starts writing beside a destination. False when the folder takes no file or the destination is none
-    /// that may be replaced (a folder, a read-only file).
+    /// Starts writing next to a destination. Returns false if the folder is not writable or the destination
+    /// must not be replaced (a folder, a read-only file).
     bool Open(const std::string& path);
-    /// Writes all bytes; false when the file system does not take them, and Commit will then fail too.
+    /// Writes all bytes. If that fails, returns false, and Commit will fail too.
     bool Write(std::string_view text);
     bool Write(std::span<const std::byte> bytes);
-    /// Replaces bytes that were written already, from an offset on; false as above.
+    /// Overwrites bytes already written, starting at an offset. If that fails, returns false, and Commit will
+    /// fail too.
     bool Rewrite(uint64_t offset, std::span<const std::byte> bytes);
-    /// Syncs and renames. False leaves the destination untouched.
+    /// Syncs and renames. If that fails, returns false and leaves the destination unchanged.
     bool Commit();
-    /// Why Open or Commit returned false: Exists when a file may not be replaced, otherwise WriteError.
+    /// Returns why Open or Commit failed: Exists if the file must not be replaced, otherwise WriteError.
     EFailure Failure() const { return m_eFailure; }
-    /// Where the bytes lie before Commit.
+    /// Returns the path of the bytes before Commit.
     const std::string& PrivatePath() const { return m_kPrivate.Path(); }
 
-    /// Answers whether the file under a private path, which has all its bytes, may take its place.
+    /// Returns whether the file at a private path, now complete, may replace its destination.
     using CommitGate = std::function<bool(const std::string& privatePath)>;
-    /// From now on Commit asks before it renames; false fails it. The gate belongs to the process: a program
-    /// that works ahead holds back here what is out of turn. An empty gate lets everything pass.
+    /// Sets a gate for the whole process: Commit calls it before it renames, and fails if it returns false. A
+    /// program that works ahead uses it to hold back files that are out of turn. An empty gate allows
+    /// everything.
     static void SetCommitGate(CommitGate gate);
-    /// From now on, files that replace nothing are not synced one by one: their writing is only begun, and
-    /// the program syncs them all later, before it claims that they are saved. A file that replaces another
-    /// is still synced first, because a power failure could otherwise cost both.
+    /// Defers the sync of files that replace nothing: their writing to disk is only started, and the program
+    /// must sync them all before it reports them as saved. A file that replaces another is still synced
+    /// first, because a power failure could otherwise lose both.
     static void DeferSyncs(bool deferred) { ms_bSyncsDeferred = deferred; }
-    /// The next Open of a path, spelled the same, replaces nothing there: neither what it finds, a link
-    /// included, nor what appears before Commit.
+    /// Makes the next Open of this path, spelled the same, fail rather than replace anything: neither an
+    /// existing file or link nor one that appears before Commit.
     static void KeepExisting(const std::string& path);
 
 private:
@@ -64,9 +66,9 @@ private:
     std::string m_kPath;
     CPrivateFile m_kPrivate;
     EFailure m_eFailure = EFailure::None;
-    unsigned m_uiMode = 0;  // of the file to be replaced; 0 if there is none
-    unsigned m_uiGroup = 0; // likewise
-    bool m_bKeeps = false;  // nothing may be replaced
+    unsigned m_uiMode = 0;  // of the file to be replaced; 0 if it does not exist
+    unsigned m_uiGroup = 0; // of the file to be replaced; 0 if it does not exist
+    bool m_bKeeps = false;  // existing files must not be replaced
     bool m_bFailed = false;
 };
 

@@ -1,6 +1,6 @@
-// A signal handler may not allocate, lock or walk objects that the program is changing. So paths are copied
-// into fixed slots, and a slot's owner says when it can be read. The owner is a process: a worker that was
-// forked has copies of the slots but not of the files.
+// A signal handler must not allocate, lock, or walk objects that the program is changing. So paths are copied
+// into fixed slots, and a slot's owner field marks it as readable. The owner is a process id, because a
+// forked worker inherits the slots but not the files.
 
 #include "LiveNames.h"
 
@@ -25,7 +25,7 @@ struct NameSlot
     char path[kPathBytes] = {};
 };
 
-NameSlot g_kSlots[16]; // a program writes one or two files at a time
+NameSlot g_kSlots[16]; // a program writes only one or two files at a time
 
 void EndBySignal(int signal)
 {
@@ -35,7 +35,7 @@ void EndBySignal(int signal)
         if (slot.owner == self)
             unlink(slot.path);
     }
-    raise(signal); // SA_RESETHAND has restored the default, which waits for this handler to return
+    raise(signal); // SA_RESETHAND has restored the default action, which runs when this handler returns
 }
 
 } // namespace

@@ -4,13 +4,13 @@
 
 namespace gw {
 
-/// Records the path of a file that must not outlive the process. Returns its number; below 0 when there are
-/// too many or the path is too long (such a file is left to the next sweep).
+/// Records the path of a file that must not outlive the process. Returns its number, or a negative number if
+/// there are too many or the path is too long (the next sweep deletes such a file).
 int AddLiveName(const std::string& path);
-/// Forgets the path of such a number; a number below 0 is ignored.
+/// Forgets the path with this number; negative numbers are ignored.
 void RemoveLiveName(int number);
-/// From now on the signals that ask a process to end (SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCPU)
-/// delete the recorded files first. Signals that the process was started to ignore stay ignored.
+/// Makes the signals that end a process (SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCPU) delete the
+/// recorded files first. Signals that were ignored at process start stay ignored.
 void RemovePrivateFilesOnSignals();
 
 } // namespace gw

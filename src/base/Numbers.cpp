@@ -1,10 +1,10 @@
-// Numbers of text files, read and written as the C library does in the C locale, whatever the locale of the
-// desktop.
+// Numbers in text files, read and written as the C library does in the C locale, whatever the desktop's
+// locale is.
 //
-// Reading. Plain decimals, which are nearly all, are read by ReadFloat; all others go through from_chars.
+// Reading: ReadFloat handles plain decimals, which are nearly all numbers. The others go through from_chars.
 //
-// Writing. A float has 24 bits and 10^6 has 14 besides its powers of two, so that their product is exact in a
-// double, and six decimals take one rounding.
+// Writing: a float has a 24-bit mantissa, and 10^6 needs 14 bits plus a power of two. Their product is
+// therefore exact in a double, and six decimals need only one rounding.
 
 #include "Numbers.h"
 
@@ -41,7 +41,7 @@ const char* SkipBlanks(const char* text, const char* end)
     return std::find_if_not(text, end, IsBlank);
 }
 
-// from_chars takes no plus sign. It stays where a second sign follows, which makes the text no number.
+// from_chars accepts no plus sign. It is kept if a second sign follows, because such a text is not a number.
 const char* SkipPlus(const char* text, const char* end)
 {
     return end - text > 1 && text[0] == '+' && text[1] != '-' ? text + 1 : text;
@@ -49,7 +49,8 @@ const char* SkipPlus(const char* text, const char* end)
 
 int64_t ReadExponent(std::string_view text)
 {
-    constexpr int64_t kEndless = int64_t{1} << 50; // so that the digits of any text can be added
+    // small enough that adding the digit count of any text cannot overflow
+    constexpr int64_t kEndless = int64_t{1} << 50;
     const char* const end = text.data() + text.size();
     int64_t exponent = 0;
     if (std::from_chars(SkipPlus(text.data(), end), end, exponent).ec == std::errc::result_out_of_range)
@@ -57,7 +58,8 @@ int64_t ReadExponent(std::string_view text)
     return std::clamp(exponent, -kEndless, kEndless);
 }
 
-// from_chars does not say on which side a number leaves the range: the place of its first digit not 0 does.
+// When a number is out of range, from_chars does not report on which side. The position of its first nonzero
+// digit does.
 bool IsHuge(std::string_view number, bool hex)
 {
     const size_t mark = std::min(number.find_first_of(hex ? "pP" : "eE"), number.size());
@@ -68,7 +70,8 @@ bool IsHuge(std::string_view number, bool hex)
     return (point - first) * (hex ? 4 : 1) + exponent > 0;
 }
 
-// from_chars wants hexadecimal digits without their prefix; there it would also take a sign, "inf" and "nan".
+// from_chars expects hexadecimal digits without the prefix, but would then also accept a sign, "inf" and
+// "nan".
 bool StartsHex(const char* text, const char* end)
 {
     if (end - text < 3 || text[0] != '0' || (text[1] | 0x20) != 'x')
@@ -76,7 +79,7 @@ bool StartsHex(const char* text, const char* end)
     return IsHexDigit(text[2]) || (text[2] == '.' && end - text > 3 && IsHexDigit(text[3]));
 }
 
-// It also takes two signs in an exponent, "p+-3".
+// from_chars also accepts two signs in an exponent, "p+-3".
 const char* EndOfHex(const char* text, const char* end)
 {
     constexpr std::string_view kOtherLetters = ".pP+-";
@@ -85,7 +88,8 @@ const char* EndOfHex(const char* text, const char* end)
     return std::search(text, std::find_if_not(text, end, belongs), kTwoSigns.begin(), kTwoSigns.end());
 }
 
-// A number of any form without blanks before it, as strtod reads it. Answers its end, or null for no number.
+// Reads a number in any form, without leading blanks, as strtod does. Returns its end, or null if it is not a
+// number.
 const char* ReadAny(const char* text, const char* end, double& value)
 {
     text = SkipPlus(text, end);
@@ -108,8 +112,7 @@ const char* ReadAny(const char* text, const char* end, double& value)
     return next;
 }
 
-// sscanf does not go back once it has begun: "0x" and "infi" are no numbers to it, where strtod reads 0 and
-// infinity.
+// sscanf never backs up: it reads "0x" and "infi" as failures, where strtod reads 0 and infinity.
 bool IsCutShort(const char* text, const char* next, const char* end, double value)
 {
     if (next == end)
@@ -121,7 +124,7 @@ bool IsCutShort(const char* text, const char* next, const char* end, double valu
     return (*next | 0x20) == 'x' && *first == '0' && next - first == 1 && !pointFollows;
 }
 
-// The same as sscanf reads it, narrowed.
+// Same as sscanf, narrowed to a float.
 const char* ReadAnyNarrowed(const char* text, const char* end, float& value)
 {
     double wide = 0.0;
@@ -144,10 +147,11 @@ ENumber KindInRow(const char* next, const char* end)
     return next == end || *next == ' ' || *next == ',' || IsBlank(*next) ? ENumber::Whole : ENumber::Stuck;
 }
 
-// The numbers below 1000 as text, from the left, for what stands before the point and in threes behind it.
+// The numbers below 1000 as text: left-aligned for the digits before the point, padded for groups of three
+// after it.
 struct Triple
 {
-    char padded[4]; // the fourth only fills a word, which is copied faster than three bytes
+    char padded[4]; // the fourth byte pads it to a word, which copies faster than three bytes
     char plain[3];
     uint8_t length;
 };
@@ -166,11 +170,13 @@ constexpr auto kTriples = [] {
     return rows;
 }();
 
-// Larger numbers, infinities and NaN are rare and go through to_chars. A million times this is below 2^52.
+// Larger numbers, infinities and NaN are rare and go through to_chars. A million times this limit is below
+// 2^52.
 constexpr float kPlainLimit = 4294967296.0f;
 constexpr uint32_t kMillion = 1000000;
 
-// A number below 2^52 rounded to the nearest integer, ties to even: next to 2^52 a double has no other bits.
+// Rounds a number below 2^52 to the nearest integer, ties to even. Adding 2^52 leaves a double no fraction
+// bits.
 uint64_t Rounded(double number)
 {
     constexpr double kAllWhole = 4503599627370496.0;

@@ -7,51 +7,52 @@
 
 namespace gw {
 
-/// What a text holds where a number should stand.
+/// Classifies a text that should be a number.
 enum class ENumber : uint8_t
 {
-    None,    ///< no number at all: "abc", "", "-"
+    None,    ///< not a number: "abc", "", "-"
     Whole,   ///< the whole text is one finite number
-    Stuck,   ///< a finite number with something stuck to it: "0.0-7.5"
-    Unusual, ///< "nan", "inf", or a number too big for the type
+    Stuck,   ///< a finite number followed directly by other characters: "0.0-7.5"
+    Unusual, ///< "nan", "inf", or too large for the type
 };
 
-/// The result of atof in the C locale, whatever the locale of the desktop: leading blanks and one sign are
-/// skipped, what follows the number is ignored, no number is 0.
+/// Same as atof in the C locale, whatever the desktop's locale is: skips leading blanks and one sign, ignores
+/// what follows the number, and returns 0 if there is no number.
 double ParseDouble(std::string_view text);
-/// The same with a verdict, for readers that warn about or refuse odd numbers.
+/// Also classifies the text, for readers that warn about or refuse odd numbers.
 double ParseDouble(std::string_view text, ENumber& kind);
-/// The result of sscanf with "%f" in the C locale; false, and value left alone, where no number stands.
-/// Parsed as 64 bits and narrowed.
+/// Same as sscanf with "%f" in the C locale. Returns false and leaves value unchanged if there is no number.
+/// Parsed as 64 bits, then narrowed.
 bool ScanFloat(std::string_view text, float& value);
 bool ScanFloat(std::string_view text, float& value, ENumber& kind);
-/// The result of atoi: leading blanks, a sign, digits; 0 for no digits. Beyond 32 bits it is the nearest end.
+/// Same as atoi: leading blanks, a sign, digits; 0 without digits. Out-of-range numbers are clamped to 32
+/// bits.
 int32_t ParseInt(std::string_view text);
-/// The result of sscanf with "%d"; false, and value left alone, where no digits stand.
+/// Same as sscanf with "%d"; returns false and leaves value unchanged if there are no digits.
 bool ScanInt(std::string_view text, int32_t& value);
 
-/// ReadFloat for numbers of any form.
+/// The slow path of ReadFloat, for numbers in any form.
 float ReadOddFloat(const char* text, const char* end, const char*& next, ENumber& kind);
 
-/// The most bytes that AppendFixed6 writes: sign, 39 digits, point, 6 digits.
+/// Maximum number of bytes that WriteFixed6 writes: sign, 39 digits, point, 6 digits.
 inline constexpr size_t kFixed6Bytes = 48;
-/// Writes a number as "%f" does in the C locale ("-0.000000", "inf", "-nan" included) and answers the end of
-/// it. Exact, also where a float's decimal expansion is cut.
+/// Writes a number as "%f" does in the C locale ("-0.000000", "inf" and "-nan" included) and returns the end.
+/// Rounds exactly.
 char* WriteFixed6(char* out, float value);
-/// The most bytes that WriteShortest writes: sign, "0.", 44 zeros and nine digits.
+/// Maximum number of bytes that WriteShortest writes: sign, "0.", 44 zeros and nine digits.
 inline constexpr size_t kShortestBytes = 64;
-/// Writes a number in the fewest decimals that read back as the same float, without an exponent, and answers
-/// the end of it.
+/// Writes a number with the fewest decimals that read back as the same float, without an exponent. Returns
+/// the end.
 char* WriteShortest(char* out, float value);
-/// The most bytes that WriteInt writes.
+/// Maximum number of bytes that WriteInt writes.
 inline constexpr size_t kIntBytes = 12;
-/// Writes a number as "%d" does and answers the end of it.
+/// Writes a number as "%d" does and returns the end.
 char* WriteInt(char* out, int32_t value);
 
 void AppendFixed6(std::string& out, float value);
-/// The same with three decimals, as "%.3f" does, for what is only looked at.
+/// Same with three decimals, as "%.3f" does, for display only.
 void AppendFixed3(std::string& out, float value);
-/// The same with any number of decimals, and without a sign before what rounds to 0.
+/// Same with any number of decimals, and without a minus sign if the result rounds to 0.
 void AppendFixed(std::string& out, double value, int decimals);
 void AppendInt(std::string& out, int32_t value);
 

@@ -83,7 +83,7 @@ bool IsLink(const std::string& path)
 
 bool IsFolderItself(const std::string& path)
 {
-    // A separator at the end would follow a link.
+    // With a trailing separator, the system would follow a link.
     const std::string bare = path.substr(0, path.find_last_not_of(kPathSeparator) + 1);
     struct stat status;
     return lstat(bare.c_str(), &status) == 0 && S_ISDIR(status.st_mode);
@@ -104,7 +104,7 @@ bool FileSize(const std::string& path, uint64_t& byteCount)
 
 bool IsReadOnly(const std::string& path)
 {
-    // The mode decides before access does: root may write a file without any write bit.
+    // Check the mode before calling access: for root, access allows writing to files without any write bit.
     struct stat status;
     if (stat(path.c_str(), &status) != 0)
         return false;
@@ -129,7 +129,7 @@ std::string FolderOf(const std::string& path)
     return path.substr(0, path.rfind(kPathSeparator) + 1); // npos + 1 is 0
 }
 
-// Not by the library's iterator, which ends the program where there is no memory for a path.
+// Not with the standard library's iterator: it ends the program if there is not enough memory for a path.
 std::vector<std::string> NamesInFolder(const std::string& folder)
 {
     std::vector<std::string> names;
@@ -161,7 +161,7 @@ std::string ExecutableFolder()
 {
     std::error_code error;
     fs::path program = fs::read_symlink("/proc/self/exe", error);
-    if (error) // a root without /proc, as some are that packages are tried in
+    if (error) // a root file system without /proc, such as a package build's
         program = fs::canonical(reinterpret_cast<const char*>(getauxval(AT_EXECFN)), error);
     return SplitPath(TextOf(program)).folder;
 }

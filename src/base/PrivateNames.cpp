@@ -1,20 +1,20 @@
-// Files under private names exist only while a program works on something else. They are hidden, nobody can
-// predict their names, and a program that is killed leaves them behind. This file decides which of them are
-// dead.
+// Private files exist only while a program is working on the real one. They are hidden, their names are
+// unpredictable, and a killed program leaves them behind. This file decides which of them are leftovers.
 //
-// A process number does not tell: a zombie still has one, and programs in containers see others' numbers as
-// free. So whoever writes such a file holds a lock on it (flock), which the kernel drops however the program
-// ends, and which holds across containers of one machine. A sweeper deletes only what it has locked itself.
+// A process id is not enough: a zombie still has one, and a container sees the ids of other containers as
+// free. Therefore the writer of a private file holds a lock on it (flock). The kernel drops that lock however
+// the program ends, and it works across the containers of one machine. A sweeper deletes only files that it
+// has locked itself.
 //
-// Between creating and locking a file, its owner can lose it to a sweeper. Then either the lock is taken or
-// the file has no name any more; the owner sees that and uses another name. A sweeper in turn makes
-// sure under its lock that the name still stands for the file that it locked, since the owner may have
-// renamed it, and only then deletes it.
+// Between creating and locking a file, its owner can lose it to a sweeper. Then either the lock fails or the
+// file has lost its name. The owner notices both and tries another name. The sweeper, once it has the lock,
+// checks that the name still refers to the locked file, since the owner may have renamed it, and only then
+// deletes it.
 //
-// Locks are trusted on the file systems of local disks and memory only. Elsewhere (network, FUSE, unknown)
-// they may be missing, or may not reach other machines. There a file that can be locked, or that cannot have
-// a lock at all, is deleted only if its program ran on this machine, in this process namespace, and is gone,
-// or if nobody has written to it for a day.
+// Locks are trusted only on local disks and in-memory file systems. Elsewhere (network, FUSE, unknown) they
+// may be missing, or may not reach other machines. There, a file that can be locked, or that cannot have a
+// lock at all, is deleted only if its program ran on this machine in this process namespace and is gone, or
+// if nobody has written to it for a day.
 
 #include "PrivateNames.h"
 
@@ -47,9 +47,9 @@ namespace {
 
 constexpr std::string_view kPrefix = ".gaitwright-";
 constexpr size_t kDigits = 8;
-constexpr size_t kPartBytes = kDigits + 1; // with the dash or the dot that follows
+constexpr size_t kPartBytes = kDigits + 1; // with the dash or dot that follows
 constexpr time_t kOldSeconds = 24 * 60 * 60;
-constexpr size_t kQuickEntries = 1000; // read in less than a millisecond
+constexpr size_t kQuickEntries = 1000; // takes less than a millisecond to read
 
 // ext2 to ext4, XFS, Btrfs, F2FS, ZFS, bcachefs, tmpfs, ramfs, overlayfs.
 constexpr uint32_t kLocalSystems[] = {0xEF53,     0x58465342, 0x9123683E, 0xF2F52010, 0x2FC12FC1,
@@ -58,7 +58,7 @@ constexpr uint32_t kLocalSystems[] = {0xEF53,     0x58465342, 0x9123683E, 0xF2F5
 enum class ELock : uint8_t
 {
     Held,
-    Taken, ///< another program has it
+    Taken, ///< another program holds it
     None,  ///< the file system has no locks
 };
 
@@ -100,14 +100,14 @@ uint32_t ReadMachineNumber()
     return AddText(AddText(2166136261u, name), processes);
 }
 
-// Of the machine and the namespace of process numbers.
+// Identifies the machine and its process namespace.
 uint32_t MachineNumber()
 {
     static const uint32_t number = ReadMachineNumber();
     return number;
 }
 
-// A part of a private name: machine, program or the random one.
+// Reads one part of a private name: machine, program or random number.
 bool ReadPart(std::string_view name, size_t part, uint32_t& number)
 {
     const size_t begin = kPrefix.size() + part * kPartBytes;
@@ -149,7 +149,7 @@ void RemoveIfDead(const std::string& path, const NameParts& parts)
     struct stat status;
     if (lstat(path.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
         return;
-    // Over a network only a descriptor that may write can hold such a lock.
+    // On network file systems, only a writable descriptor can hold such a lock.
     const int file = open(path.c_str(), O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
     if (file < 0)
         return;
@@ -173,7 +173,7 @@ void Sweep(const std::string& folder, size_t entryLimit)
     }
 }
 
-// Whether a folder has not been swept by this process or the one that it was forked from.
+// Returns whether neither this process nor its parent before the fork has swept the folder.
 bool IsFirstSweep(const std::string& folder)
 {
     static std::mutex mutex;

@@ -5,20 +5,20 @@
 
 namespace gw {
 
-/// A new private name in a folder, which ends in a separator or is empty; with an extension, dot included. It
-/// does not contain the name of the file that it stands for, so that a long one stays within the system's
-/// limit.
+/// Returns a new private name in a folder (empty or with a trailing separator), with an extension, dot
+/// included. It does not contain the destination's name, so it stays within the system's limit even if that
+/// name is long.
 std::string PrivateName(const std::string& folder, std::string_view extension);
-/// Whether a file name without a folder is such a name.
+/// Returns whether a file name, without folder, is a private name.
 bool IsPrivateName(std::string_view name);
 
-/// Locks a file that was just created under a private name, until its descriptor is closed. True also on a
-/// file system without locks; false when another program has swept the file, so that it needs another name.
+/// Locks a newly created private file until its descriptor is closed. Returns true also on file systems
+/// without locks. Returns false if another program has swept the file; then use another name.
 bool LockNewFile(int file);
-/// Deletes the private files in a folder that no living program holds.
+/// Deletes the private files in a folder that no running program holds.
 void RemoveLeftovers(const std::string& folder);
-/// The same before a file is written, but at most once per folder and process, and not beyond the first
-/// thousand entries, so that saving stays fast in huge folders.
+/// Same as RemoveLeftovers, for use before a file is written: at most once per folder and process, and
+/// limited to the first thousand entries, so that saving stays fast in huge folders.
 void SweepOnce(const std::string& folder);
 
 } // namespace gw

@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// What sscanf and the C locale count as blank.
+// The characters that sscanf and the C locale treat as blank.
 constexpr std::string_view kBlanks = " \t\n\v\f\r";
 
 char Lower(char c)
@@ -22,7 +22,7 @@ char Upper(char c)
     return c >= 'a' && c <= 'z' ? static_cast<char>(c - ('a' - 'A')) : c;
 }
 
-// A set of bytes, so that a token costs one look-up for each of its characters.
+// A set of bytes with one table look-up per character.
 class CByteSet
 {
 public:
@@ -40,8 +40,8 @@ private:
     uint64_t m_uiBits[4] = {};
 };
 
-// Whether a byte may stand behind a lead byte: three and four bytes could spell what fewer bytes spell, half
-// of a surrogate pair, or what is beyond the last code point.
+// Checks the second byte of a UTF-8 sequence: rejects overlong forms, surrogates, and code points beyond the
+// last one.
 bool MayFollow(unsigned char lead, unsigned char second)
 {
     const unsigned char least = lead == 0xe0 ? 0xa0 : lead == 0xf0 ? 0x90 : 0x80;
@@ -49,7 +49,7 @@ bool MayFollow(unsigned char lead, unsigned char second)
     return least <= second && second <= most;
 }
 
-// The bytes of the UTF-8 character at the front of a text, or 0 for what is none: a stray or cut sequence.
+// Returns the length of the UTF-8 character at the front of a text, or 0 for a stray or truncated sequence.
 size_t CharacterLength(std::string_view text)
 {
     const auto lead = static_cast<unsigned char>(text.front());
@@ -68,7 +68,7 @@ size_t CharacterLength(std::string_view text)
     return std::ranges::all_of(text.substr(1, length - 1), follows) ? length : 0;
 }
 
-// Control characters: those of ASCII and those from U+0080 to U+009F, which terminals obey as well.
+// ASCII control characters, and U+0080 to U+009F, which terminals obey too.
 bool IsControl(std::string_view character)
 {
     const auto lead = static_cast<unsigned char>(character.front());
@@ -87,7 +87,8 @@ void AppendEscaped(std::string& out, std::string_view bytes)
     }
 }
 
-// The least number of letters to put in, to take out or to change (Wagner and Fischer 1974), row by row.
+// Returns the minimum number of insertions, deletions and substitutions (Wagner and Fischer 1974), row by
+// row.
 size_t EditDistance(std::string_view a, std::string_view b)
 {
     std::vector<size_t> row(b.size() + 1);
@@ -190,11 +191,12 @@ std::string Quoted(std::string_view name)
 
 std::string NearestName(std::string_view name, const std::vector<std::string>& candidates)
 {
-    // The distance takes time by the product of the lengths, and a name comes from a file.
+    // The distance takes time proportional to the product of the lengths, and names come from files.
     constexpr size_t kLongestName = 64;
     if (name.empty() || name.size() > kLongestName)
         return {};
-    // A third of the letters may differ: a slip or a missing syllable, and no other word.
+    // A third of the letters may differ: enough for a typo or a missing syllable, too few for a different
+    // word.
     size_t limit = std::max<size_t>(name.size() / 3, 1) + 1;
     const std::string* nearest = nullptr;
     for (const std::string& candidate : candidates)

@@ -1,9 +1,9 @@
-// A file that another program truncates, or whose disk fails, loses pages of its mapping, and touching one
-// raises SIGBUS in the thread that reads. The handler puts pages of zeros there, notes it and returns, so
-// that the read continues; whoever reads asks at the end whether the file was whole. A signal that is about
-// anything else goes to the handler that was there before.
+// If another program truncates a file, or its disk fails, pages of its mapping disappear, and touching one
+// raises SIGBUS in the reading thread. The handler maps pages of zeros there, records it and returns, so the
+// read continues. The reader checks at the end whether the file was whole. Any other SIGBUS goes to the
+// previous handler.
 //
-// A handler may take no lock and allocate nothing, so the ranges stand in fixed slots of atomics.
+// A signal handler must not lock or allocate, so the ranges are kept in fixed slots of atomics.
 
 #include "WatchedRange.h"
 
@@ -29,7 +29,7 @@ bool PatchAt(uintptr_t address)
         const uintptr_t end = range.end;
         if (begin == 0 || address < begin || address >= end)
             continue;
-        // What follows is missing too, so one signal is enough.
+        // Everything after this page is missing too, so one signal is enough.
         const uintptr_t page = address / g_uiPageSize * g_uiPageSize;
         range.cut = true;
         return mmap(reinterpret_cast<void*>(page), end - page, PROT_READ,
@@ -51,7 +51,7 @@ void OnBusError(int signal, siginfo_t* info, void* context)
     else if (g_kBefore.sa_handler != SIG_DFL && g_kBefore.sa_handler != SIG_IGN)
         g_kBefore.sa_handler(signal);
     else
-        std::signal(signal, SIG_DFL); // and the access is made again, which ends the program
+        std::signal(signal, SIG_DFL); // the access is repeated, which ends the program
 }
 
 bool Install()
@@ -60,7 +60,7 @@ bool Install()
     struct sigaction action = {};
     action.sa_sigaction = OnBusError;
     action.sa_flags = SA_SIGINFO | SA_ONSTACK;
-    sigaction(SIGBUS, nullptr, &g_kBefore); // known before the handler can run
+    sigaction(SIGBUS, nullptr, &g_kBefore); // stored before our handler can run
     return sigaction(SIGBUS, &action, nullptr) == 0;
 }
 
@@ -68,7 +68,7 @@ bool Install()
 
 WatchedRange* Watch(const void* begin, size_t byteCount)
 {
-    constexpr uintptr_t kClaimed = 1; // no mapping begins there
+    constexpr uintptr_t kClaimed = 1; // no mapping starts there
     static const bool installed = Install();
     for (WatchedRange& range : g_kRanges)
     {

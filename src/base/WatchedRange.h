@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// A mapped range of a file. Reading a page that the file has lost since gives zeros and marks the range,
-/// where it would otherwise end the program with SIGBUS.
+/// A mapped range of a file. Reading a page that the file has lost yields zeros and marks the range; without
+/// it, SIGBUS would end the program.
 struct WatchedRange
 {
     std::atomic<uintptr_t> begin{0}; ///< 0: free
@@ -15,7 +15,7 @@ struct WatchedRange
     std::atomic<bool> cut{false}; ///< pages were missing
 };
 
-/// Watches a mapping until Unwatch, which must come before it is unmapped. Null when too many are watched.
+/// Watches a mapping. Call Unwatch before unmapping it. Returns null if too many ranges are watched.
 WatchedRange* Watch(const void* begin, size_t byteCount);
 void Unwatch(WatchedRange* range);
 

@@ -9,14 +9,15 @@ namespace gw {
 
 namespace {
 
-constexpr float kFirstLength = 0.3f; // of the bone's own offset, until a child says how long it is
+// initially a share of the bone's own offset; a child then determines the real length
+constexpr float kFirstLength = 0.3f;
 
 float OffsetLength(const CNode& node)
 {
     return static_cast<float>(Vec3Length(node.m_kMatrix.Translation()));
 }
 
-// Slots that hold a child: attaching children leaves spare ones.
+// Counts the slots that hold a child; attaching children leaves spare ones.
 size_t HeldChildCount(const CNode& node)
 {
     size_t count = 0;
@@ -36,8 +37,8 @@ void AttachBoneMesh(CNode& node)
     node.AttachChild(mesh.Get());
 }
 
-// What turns +Y into the axis that dominates an offset, whatever its sign. Where Y dominates or none does,
-// the rotation stays that of the node before.
+// Rotates +Y to the dominant axis of an offset, whatever its sign. If that is Y, or no axis dominates, the
+// rotation of the previous node is kept.
 void TurnToOffset(const Vec3& offset, Mat3& rotation)
 {
     const float x = offset.x * offset.x;

@@ -4,8 +4,9 @@ namespace gw {
 
 class CObject;
 
-/// Dresses the nodes of a loaded tree with bone meshes: balls where a node has more than one child slot, else
-/// tapered bones that reach to the child along the dominant axis. Null has no nodes. Always true.
+/// Attaches bone meshes to the nodes of a loaded tree: balls to nodes with more than one child slot,
+/// otherwise tapered bones that reach to the child along the dominant axis. `root` may be null. Always
+/// returns true.
 bool AttachBoneMeshes(CObject* root);
 
 } // namespace gw

@@ -7,17 +7,17 @@ namespace gw {
 class CBoneMesh;
 class CNode;
 
-/// A node's first child that is a bone mesh, or null.
+/// Returns a node's first child that is a bone mesh, or null.
 CBoneMesh* FindBoneMesh(const CNode& node);
-/// The length of that mesh, 0 without one.
+/// Returns the length of that mesh, or 0 without one.
 float NodeBoneLength(const CNode& node);
-/// The direction of the bone in the space of that mesh, kVec3Zero without one.
+/// Returns the direction of the bone in the mesh's space, or kVec3Zero without one.
 Vec3 NodeBoneAxis(const CNode& node);
-/// The world matrix of that mesh, the node's own without one.
+/// Returns the world matrix of that mesh, or the node's own without one.
 const Mat4& NodeBoneWorld(const CNode& node);
 
-/// Where the bone of a node without children ends, in the node's space: as the file told it, else as that
-/// mesh shows it. Zero without a mesh or a length.
+/// Returns the end of the bone of a node without children, in the node's space: as stored in the file,
+/// otherwise as that mesh shows it. Zero without a mesh or a length.
 Vec3 NodeBoneEnd(const CNode& node);
 
 } // namespace gw

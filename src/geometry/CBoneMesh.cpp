@@ -37,8 +37,8 @@ constexpr Triangle kShapeTriangles[] = {
     {2, 3, 5},
 };
 
-// The ball: an icosahedron that stands on a corner, each edge split once and its middle pushed out to the
-// sphere. Corner 0 is the top, 1 to 5 the upper ring, 6 to 10 the lower ring, half a step further round, 11
+// The ball: an icosahedron standing on a corner, with each edge split once and its middle pushed out to the
+// sphere. Corner 0 is the top, 1 to 5 the upper ring, 6 to 10 the lower ring (half a step further round), 11
 // the bottom.
 constexpr float kRadius = 0.125f;
 constexpr uint32_t kCornerCount = 12;
@@ -56,7 +56,7 @@ constexpr Vec3 kCorners[kCornerCount] = {
     {0.72360680f,  -0.52573111f, -0.4472136f},
     {0.0f,         0.0f,         -1.0f      },
 };
-// The corners at the ends of each edge. The middle of edge i is point 12 + i.
+// The corners of each edge. The middle of edge i is point 12 + i.
 constexpr std::array<uint32_t, 2> kEdges[] = {
     {0,  1 },
     {0,  2 },
@@ -153,7 +153,8 @@ bool BuildShape(CBoneMesh& mesh, float length, std::span<const Vec3> points,
         return false;
     if (!mesh.SetPointCount(static_cast<int32_t>(points.size())) ||
         !mesh.SetTriangleQuantity(static_cast<int32_t>(triangles.size())))
-        throw std::bad_alloc(); // as for any part of a skeleton: without its length, it would convert wrongly
+        // like any part of a skeleton: without its length, it would be converted wrongly
+        throw std::bad_alloc();
     mesh.m_fLength = length;
     std::ranges::transform(points, mesh.XYZBuffer().begin(),
                            [=](const Vec3& point) { return point * length; });

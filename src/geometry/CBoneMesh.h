@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A small solid of fixed shape that shows a bone, scaled to the bone's length and hung under the bone's
-/// node. In a file it is a triangle mesh under its own class name, which no reader takes back; its clone is a
+/// A small solid of fixed shape that displays a bone, scaled to the bone's length and attached to the bone's
+/// node. In a file it is a triangle mesh under its own class name, which cannot be read back; its clone is a
 /// plain CTriMesh.
 class CBoneMesh : public CTriMesh
 {
@@ -15,18 +15,18 @@ public:
     CBoneMesh() { m_bBoneMesh = true; }
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
 
-    /// Makes the shape at a length. False, and nothing changes, at or below 0.
+    /// Builds the shape with a length. If the length is not positive, returns false and changes nothing.
     virtual bool Build(float length) = 0;
-    /// The direction of the bone in the mesh's own space; zero for a mesh that has none.
+    /// Returns the direction of the bone in the mesh's own space; zero if it has none.
     virtual Vec3 Axis() const { return kVec3Zero; }
 
-    float m_fLength = 0.0f; ///< given to the last Build that succeeded
-    /// Where the bone ends in its node's space, as a file told it; zero where none did. The mesh's direction
-    /// is not always that: see TKBVHStream.
+    float m_fLength = 0.0f; ///< of the last successful Build
+    /// End of the bone in its node's space, as stored in a file; zero if not stored. The mesh can point
+    /// elsewhere: see TKBVHStream.
     Vec3 m_kEnd = kVec3Zero;
 };
 
-/// A ball of radius 0.125 x length, for a bone that branches.
+/// A ball of radius 0.125 x length, for a branching bone.
 class CBoneNodeMesh : public CBoneMesh
 {
 public:
@@ -52,7 +52,7 @@ public:
     Vec3 m_kAxis = kVec3UnitY;
 };
 
-/// A class of bone mesh that has a record and that nothing makes.
+/// A bone mesh class that has a record but is never created.
 class CBoneObjMesh : public CBoneMesh
 {
 public:

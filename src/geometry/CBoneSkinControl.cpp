@@ -1,3 +1,7 @@
+// Skinning. Files store influences by bone, but points are transformed one by one, so RebuildSkinTables sorts
+// the influences by point once and groups the points by their number of influences. Each update blends the
+// matrices of a point's bones and transforms the point once.
+
 #include "CBoneSkinControl.h"
 
 #include "CFieldArchive.h"
@@ -12,14 +16,14 @@ const CRTTI CBoneSkinControl::ms_kRTTI{"CBoneSkinControl", &CControl::ms_kRTTI};
 
 namespace {
 
-// All sixteen elements: where weights sum to more than 1, the fourth result divides the point.
+// All sixteen elements: if weights sum to more than 1, the fourth coordinate divides the point.
 void AddScaled(Mat4& sum, const Mat4& matrix, float weight)
 {
     for (size_t i = 0; i < std::size(sum.m); ++i)
         sum.m[i] += weight * matrix.m[i];
 }
 
-// What the weights lack up to 1 goes to the mesh's own matrix.
+// The remainder of the weights up to 1 goes to the mesh's own matrix.
 Mat4 Blend(const CSkinPointRecord& point, std::span<const Mat4> matrices, const Mat4& world)
 {
     Mat4 blend = kMat4Zero;
@@ -112,7 +116,7 @@ std::vector<CSpatial*> CBoneSkinControl::CurrentBones() const
     return bones;
 }
 
-// Those that act, by point, and for one point in the order of the bones.
+// Returns the effective influences sorted by point, then in bone order.
 std::vector<CBoneSkinControl::Influence> CBoneSkinControl::SortedInfluences() const
 {
     std::vector<Influence> influences;
@@ -160,7 +164,7 @@ void CBoneSkinControl::RebuildSkinTables()
 
     m_kPoints.clear();
     m_kGroups.assign(1, {});
-    uint32_t next = 0; // the first point that is in no group yet
+    uint32_t next = 0; // the first point that is not yet in a group
     for (size_t first = 0; first < influences.size();)
     {
         const uint32_t point = influences[first].point;
@@ -197,7 +201,7 @@ bool CBoneSkinControl::Bind(CObject& root)
         CSpatial* bone = bones.Find(record.m_pkBone.Get());
         if (!bone)
             continue;
-        // As if added one by one, each in front of the others.
+        // As if they were added one by one, each before the others.
         std::vector<SkinInfluence>& influences = RecordOf(*bone, record.m_kOffset).m_kInfluences;
         influences.insert(influences.begin(), record.m_kInfluences.rbegin(), record.m_kInfluences.rend());
     }
@@ -234,7 +238,7 @@ bool CBoneSkinControl::Update(float)
     if (!AreTablesCurrent(points.size()))
         RebuildSkinTables();
     const Mat4& world = target->m_kWorldMatrix;
-    // Behind a control that has already put the points into the world they first go back to the model.
+    // If a previous control has moved the points to world space, transform them back to model space first.
     const std::vector<Mat4> matrices =
         SkinMatrices(target->m_bWorldValid ? Mat4InverseOrIdentity(world) : kMat4Identity);
     for (const SkinPointRun& run : m_kGroups.front())

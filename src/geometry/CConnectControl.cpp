@@ -33,7 +33,7 @@ bool CConnectControl::Update(float time)
     CGeometry* target = RecordCast<CGeometry>(GetTarget());
     if (!m_bActive || !target)
         return false;
-    // Both sides know each other by the control's own time.
+    // The two sides compare the control's own time.
     const float keyTime = MapTime(time);
     if (m_spkConnectData)
         m_spkConnectData->Reach(*target, keyTime);

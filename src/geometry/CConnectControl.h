@@ -6,7 +6,7 @@ namespace gw {
 
 class CConnectData;
 
-/// Tells a seam that its target, one of the two meshes, has reached a time.
+/// Notifies a seam that its target, one of the two meshes, has reached a time.
 class CConnectControl : public CControl
 {
 public:
@@ -19,7 +19,7 @@ public:
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// Makes the target's normals current and lets the seam close if it can. Always false.
+    /// Updates the target's normals and closes the seam if possible. Always returns false.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
 

@@ -18,7 +18,7 @@ void GroupFields(CFieldArchive& archive, const char* name, std::vector<CConnectD
     });
 }
 
-// The point of a pair, or null where the file names one that is not there.
+// Returns the point of a pair, or null if the file names a point that does not exist.
 Vec3* PointOf(const Side& side, size_t pair)
 {
     const std::span<Vec3> points = side.m_pkMesh->WorldXYZBuffer();
@@ -26,7 +26,7 @@ Vec3* PointOf(const Side& side, size_t pair)
     return point < points.size() ? &points[point] : nullptr;
 }
 
-// Shows each normal of a pair's group that is there.
+// Calls a function for each existing normal of a pair's group.
 template <class F>
 void ForEachNormal(const Side& side, size_t pair, F visit)
 {
@@ -100,7 +100,7 @@ bool CConnectData::Update(float time)
     return true;
 }
 
-// In the order of the pairs and in place: a point named twice moves twice.
+// In pair order and in place: a point that is named twice moves twice.
 void CConnectData::JoinPoints(size_t pair)
 {
     Vec3* const a = PointOf(m_kFirst, pair);

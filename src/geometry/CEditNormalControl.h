@@ -6,7 +6,7 @@ namespace gw {
 
 class CEditNormalData;
 
-/// Lets normals be smoothed across meshes once its target, one of them, is up to date.
+/// Triggers smoothing of normals across meshes once its target, one of them, is up to date.
 class CEditNormalControl : public CControl
 {
 public:
@@ -19,11 +19,11 @@ public:
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// Makes the target's normals current and lets the smoothing run if it can. Always false.
+    /// Updates the target's normals and smooths if possible. Always returns false.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
 
-    Held<CEditNormalData> m_spkEditNormalData; ///< shared by the controls on all its meshes
+    Held<CEditNormalData> m_spkEditNormalData; ///< shared by the controls of all its meshes
 };
 
 } // namespace gw

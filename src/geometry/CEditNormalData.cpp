@@ -15,7 +15,7 @@ namespace {
 using Record = CEditNormalData::Record;
 using Places = std::vector<NormalPlace>;
 
-// Appends each selected normal of a mesh once, at the first corner that names it.
+// Appends each selected normal of a mesh once, at the first corner that uses it.
 void AppendPlaces(Places& places, const Record& record, size_t index)
 {
     CTriMesh& mesh = *record.m_pkMesh.Get();
@@ -34,7 +34,7 @@ void AppendPlaces(Places& places, const Record& record, size_t index)
     }
 }
 
-// A selected normal that no corner names stays at zero.
+// A selected normal that no corner uses stays zero.
 void ClearSelected(const Record& record)
 {
     const std::span<Vec3> normals = record.m_pkMesh->WorldNormalBuffer();
@@ -93,7 +93,7 @@ bool CEditNormalData::Update(float time)
     return true;
 }
 
-// By the old normals of all meshes alone.
+// Computed only from the previous normals of all meshes.
 std::vector<Vec3> CEditNormalData::SmoothedNormals(std::span<const NormalPlace> places) const
 {
     const CPlaceGrid grid(places, m_fThreshold);

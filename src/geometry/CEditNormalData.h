@@ -13,8 +13,8 @@ class CTriMesh;
 struct NormalPlace;
 struct Vec3;
 
-/// Smooths selected normals across meshes: where points of different meshes are near each other, their
-/// normals become one. The last mesh that an update reaches starts the work.
+/// Smooths selected normals across meshes: where points of different meshes are close together, their normals
+/// become equal. The last mesh to be updated triggers the work.
 class CEditNormalData : public CObject
 {
 public:
@@ -33,12 +33,12 @@ public:
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// False until the normals of all meshes are current.
+    /// Returns false until the normals of all meshes are up to date.
     bool Update(float time) override;
 
     std::vector<Record> m_kMeshes;
     bool m_bEnabled = true;    ///< stored and copied only
-    float m_fThreshold = 0.0f; ///< points nearer than this count as one place
+    float m_fThreshold = 0.0f; ///< points closer than this count as one place
 
 private:
     std::vector<Vec3> SmoothedNormals(std::span<const NormalPlace> places) const;

@@ -1,3 +1,6 @@
+// Points, normals and colors with their world copies. Sizes come from files and can be anything, so every
+// allocation can fail, and counts without data are kept but never used as limits.
+
 #include "CGeometry.h"
 
 #include "CFieldArchive.h"
@@ -76,7 +79,7 @@ bool CGeometry::Update(float time)
 {
     m_bNormalsValid = false;
     m_bWorldValid = false;
-    m_kWorldXYZ = m_kXYZ; // keeps its memory
+    m_kWorldXYZ = m_kXYZ; // keeps the allocated memory
     CSpatial::Update(time);
     if (!m_bWorldValid)
         UpdateWorldPoints();
@@ -119,7 +122,7 @@ bool CGeometry::SetPointCount(int32_t count)
         return false;
     m_kXYZ = std::move(model);
     m_kWorldXYZ = std::move(world);
-    m_kXYZMtl.clear(); // one id for each point, or none
+    m_kXYZMtl.clear(); // one id per point, or empty
     return true;
 }
 

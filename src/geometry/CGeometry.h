@@ -11,9 +11,9 @@ namespace gw {
 
 class CMaterialBase;
 
-/// A spatial with points, normals and colours. The model buffers stay untouched: each update makes a world
-/// copy of them, controls deform that copy, and whoever draws reads it. Files may name points and normals
-/// that there are not, so every index is checked by those who follow it.
+/// A spatial with points, normals and colors. Model buffers are not modified: each update makes a world copy,
+/// controls deform that copy, and renderers read it. Files can refer to points and normals that do not exist,
+/// so users of an index must check it.
 class CGeometry : public CSpatial
 {
 public:
@@ -24,61 +24,63 @@ public:
     void Fields(CFieldArchive& archive) override;
     void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
-    /// Copies the model points, runs the controls, and brings to the world what they left in model space.
+    /// Copies the model points, runs the controls, and transforms to world space whatever they left in model
+    /// space.
     bool Update(float time) override;
-    /// Copies the model points and passes the call on; points stay in model space and normals as they are.
+    /// Copies the model points and runs the base update; points stay in model space, normals unchanged.
     bool UpdateRange(uint32_t range, float time) override;
     void UpdateBound() override;
-    /// Keeps what is in force in the slots of this geometry.
+    /// Stores the render states in effect in the slots of this geometry.
     void ApplyRenderStates(RenderStateStack& stack) override;
 
     virtual void UpdateWorldNormals() {}
-    /// Takes the world points from model to world space, as they stand.
+    /// Transforms the current world points from model to world space.
     virtual void UpdateWorldPoints();
 
-    /// Sizes model and world points; contents and material ids are lost. Returns false, and changes nothing,
-    /// below 1 or if there is not enough memory, as all sizing does.
+    /// Sizes model and world points; contents and material ids are lost. Returns false and changes nothing if
+    /// the count is below 1 or there is not enough memory, as do all functions that set a size.
     bool SetPointCount(int32_t count);
     /// Sizes model and world normals; contents are lost.
     bool SetNormalCount(int32_t count);
-    /// Sizes the colours; contents are lost.
+    /// Sizes the colors; contents are lost.
     bool SetColorCount(int32_t count);
-    /// Gives each point a material id of 0; false when there are no points.
+    /// Assigns material id 0 to each point; false if there are no points.
     bool CreateXYZMtl();
 
-    // Buffers under the names that they have always had; empty where there is no block.
+    // Buffers, under the names that they have always had; empty if a block is missing.
 
     std::span<Vec3> XYZBuffer() { return m_kXYZ; }                     ///< model space
-    std::span<Vec3> WorldXYZBuffer() { return m_kWorldXYZ; }           ///< as many as XYZBuffer
-    std::span<uint32_t> XYZMtl() { return m_kXYZMtl; }                 ///< a material id for each point
+    std::span<Vec3> WorldXYZBuffer() { return m_kWorldXYZ; }           ///< same size as XYZBuffer
+    std::span<uint32_t> XYZMtl() { return m_kXYZMtl; }                 ///< one material id per point
     std::span<Vec3> NormalBuffer() { return m_kNormal; }               ///< model space
-    std::span<Vec3> WorldNormalBuffer() { return m_kWorldNormal; }     ///< as many as NormalBuffer
+    std::span<Vec3> WorldNormalBuffer() { return m_kWorldNormal; }     ///< same size as NormalBuffer
     std::span<Vec3> ColorBuffer() { return m_kColor; }                 ///< red, green, blue
-    std::span<uint32_t> VertexXYZIndex() { return m_kVertexXYZIndex; } ///< for each render vertex, its point
+    std::span<uint32_t> VertexXYZIndex() { return m_kVertexXYZIndex; } ///< the point of each render vertex
     std::span<uint32_t> VertexNormalIndex() { return m_kVertexNormalIndex; } ///< its normal
-    std::span<uint32_t> VertexColorIndex() { return m_kVertexColorIndex; }   ///< its colour
-    /// Render vertices as told by the file or the last vertex table. The index lists above have as many
-    /// entries or none.
+    std::span<uint32_t> VertexColorIndex() { return m_kVertexColorIndex; }   ///< its color
+    /// Returns the number of render vertices, as stored in the file or set by the last vertex table. The
+    /// index lists above have that many entries or none.
     int32_t GetVertexQuantity() const { return m_iVertexCount; }
 
     CMaterialBase* GetMaterial() const;
     void SetMaterial(CMaterialBase* material);
-    /// What the last render state walk left here, or null.
+    /// Returns the state that the last render walk stored, or null.
     CRenderState* GetRenderState(size_t type) const { return m_aspkRenderState[type].Get(); }
 
     bool m_bBoneMesh = false;     ///< stored and copied only
     bool m_bNormalsValid = false; ///< world normals are current
-    bool m_bWorldValid = false;   ///< world points are in world space; a control that puts them there sets it
-    bool m_bAutoNormals = true;   ///< each update computes the world normals
+    bool m_bWorldValid = false;   ///< world points are in world space; set by a control that moves them there
+    bool m_bAutoNormals = true;   ///< each update recomputes the world normals
 
 protected:
     CGeometry();
     CGeometry(const CGeometry& source);
     void CloneHeld(CCloneMap& map, CObject& copy) override;
     void AppendBindOrder(std::vector<CObject*>& order) override;
-    /// Gives the world at least so many points, for a class that writes them itself.
+    /// Enlarges the world points to at least a count, for a class that writes them itself.
     void GrowWorldPoints(size_t count);
-    /// Sizes the index lists of the render vertices: those asked for get `count` entries, the others none.
+    /// Sizes the index lists of the render vertices: the selected ones to `count` entries, the others to
+    /// none.
     void SetVertexCount(size_t count, bool points, bool normals, bool colors);
 
 private:
@@ -93,7 +95,7 @@ private:
     std::vector<uint32_t> m_kVertexColorIndex;
     std::array<Held<CRenderState>, kRenderStateTypes> m_aspkRenderState;
     Held<CMaterialBase> m_spkMaterialBase;
-    // Counts as files have them: they may stand without a block, and then bound nothing.
+    // Counts as stored in files. Without a block they limit nothing.
     int32_t m_iNormalCount = 0;
     int32_t m_iColorCount = 0;
     int32_t m_iVertexCount = 0;

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// A selection on a mesh, kept for others; it changes nothing.
+/// A stored selection on a mesh; it changes nothing.
 class CMeshSelControl : public CControl
 {
 public:

@@ -50,7 +50,7 @@ void CMorphControl::MovePoints(CGeometry& target, float weight) const
             points[i] = points[i] + m_kDeltas[i] * weight;
         return;
     }
-    // The points are in the world already: the offset turns with the mesh and does not move it.
+    // The points are already in world space: rotate the offset with the mesh, but do not translate it.
     Mat4 turn = target.m_kWorldMatrix;
     turn.SetTranslation(kVec3Zero);
     for (size_t i = 0; i < count; ++i)

@@ -10,8 +10,8 @@ namespace gw {
 
 class CGeometry;
 
-/// Adds an offset to each point of its target, a geometry, by a weight that changes over time. Several of
-/// them on one mesh add up. Normals follow from the moved points.
+/// Adds weighted offsets to the points of its target, a geometry; the weight changes over time. Several
+/// morphs on one mesh add up. Normals are computed from the moved points.
 class CMorphControl : public CControl
 {
 public:
@@ -21,13 +21,13 @@ public:
     CObject* CreateClone() const override { return new CMorphControl(*this); }
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// False where it is off or has keys and no target.
+    /// Returns false if it is inactive, or has keys but no target.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
 
-    std::vector<Vec3> m_kDeltas; ///< model space, from the first point on; points beyond stay
+    std::vector<Vec3> m_kDeltas; ///< model space, starting at the first point; later points do not move
     std::vector<float> m_kWeights;
-    std::vector<float> m_kKeyTimes; ///< ascending, one for each weight
+    std::vector<float> m_kKeyTimes; ///< ascending, one per weight
 
 private:
     void MovePoints(CGeometry& target, float weight) const;

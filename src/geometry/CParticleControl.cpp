@@ -1,3 +1,6 @@
+// Particle births and motion. Each update computes the elapsed time since the last one, ages and moves the
+// living particles by it, and fills dead slots with new ones at the rate.
+
 #include "CParticleControl.h"
 
 #include "CFieldArchive.h"
@@ -89,7 +92,7 @@ void CParticleControl::Step(float keyTime)
     ++target->m_uiChangeStamp;
 }
 
-// The fraction is kept for the next step, so that slow rates do not starve.
+// The fraction carries over to the next step, so that slow rates still produce particles.
 size_t CParticleControl::CountBirths(double elapsed, size_t free)
 {
     const double births = elapsed * static_cast<double>(m_fRate) + m_fCarry;

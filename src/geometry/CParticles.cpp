@@ -10,7 +10,7 @@ const CRTTI CParticles::ms_kRTTI{"CParticles", &CGeometry::ms_kRTTI};
 
 namespace {
 
-size_t s_uiSlots = 0; // of all particle systems that live
+size_t s_uiSlots = 0; // of all living particle systems
 
 } // namespace
 
@@ -43,7 +43,7 @@ uint64_t CParticles::GetMemoryUsed() const
     return CGeometry::GetMemoryUsed() + 28 + m_kParticles.size() * sizeof(Particle);
 }
 
-// The control has written the world points, so they are neither copied anew nor taken to the world.
+// The control has written the world points, so they are neither copied nor transformed again.
 bool CParticles::Update(float time)
 {
     m_bNormalsValid = false;

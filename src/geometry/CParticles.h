@@ -4,19 +4,19 @@
 
 namespace gw {
 
-/// One particle of a system but for its place, which is a world point of the geometry.
+/// A particle of a system, without its position, which is a world point of the geometry.
 struct Particle
 {
     Vec3 m_kVelocity = kVec3Zero;
-    float m_fLife = -1.0f; ///< time left; below 0 it is dead
+    float m_fLife = -1.0f; ///< remaining life; dead if negative
     float m_fSize = 0.0f;  ///< 0 when dead
     std::array<float, 4> m_afColor{};
 
     bool IsLive() const { return m_fLife >= 0.0f; }
 };
 
-/// A geometry whose world points are particles. A control gives birth to them and moves them; an update
-/// leaves the world points as they stand.
+/// A geometry whose world points are particles. A control creates and moves them; an update does not touch
+/// the world points.
 class CParticles : public CGeometry
 {
 public:
@@ -32,17 +32,17 @@ public:
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;
 
-    /// Makes room for particles up to a count, within the capacity and kMostSlots; what is there stays. All
-    /// of the capacity at once would let a few bytes of a file take any memory.
+    /// Makes room for a number of particles, within the capacity and kMostSlots; existing ones are kept.
+    /// Allocating the whole capacity at once would let a few bytes in a file take any amount of memory.
     void MakeRoom(size_t count);
-    /// The particles that there is room for, each with its world point.
+    /// Returns the particle slots, each with its world point.
     std::span<Particle> Particles() { return m_kParticles; }
 
     int32_t m_iParticleCount = 0; ///< capacity, as stored
-    int32_t m_iActiveCount = 0;   ///< particles alive; not stored
+    int32_t m_iActiveCount = 0;   ///< living particles; not stored
     uint32_t m_uiStoredValue = 0; ///< stored and copied only
 
-    /// Particles of all systems together.
+    /// Limit for the particles of all systems together.
     static constexpr size_t kMostSlots = size_t{1} << 18;
 
 private:

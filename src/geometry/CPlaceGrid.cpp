@@ -7,7 +7,7 @@ namespace gw {
 
 namespace {
 
-// Rounding must not push two near points two cells apart.
+// Rounding must not put two close points two cells apart.
 constexpr double kCellsPerDistance = 1.01;
 
 int64_t CellIndex(float coordinate, double distance)
@@ -55,7 +55,7 @@ Vec3 CPlaceGrid::SumNear(const NormalPlace& place) const
     const Cell middle = CellOf(place.m_kPoint);
     for (int64_t x = middle.x - 1; x <= middle.x + 1; ++x)
     {
-        // Cells beside each other along z are one run.
+        // Neighboring cells along z form one run.
         for (int64_t y = middle.y - 1; y <= middle.y + 1; ++y)
             sum = sum + SumRun(place, {x, y, middle.z - 1}, {x, y, middle.z + 1});
     }

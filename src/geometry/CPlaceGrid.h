@@ -10,24 +10,24 @@
 
 namespace gw {
 
-/// A selected normal of one of several meshes, with the place where it stands.
+/// A selected normal of one of several meshes, and its position.
 struct NormalPlace
 {
     size_t m_uiMesh;     ///< which of the meshes
-    uint32_t m_uiNormal; ///< index of the normal in it
-    Vec3 m_kPoint;       ///< in the world
+    uint32_t m_uiNormal; ///< index of the normal in that mesh
+    Vec3 m_kPoint;       ///< in world space
     Vec3 m_kNormal;
 };
 
-/// Places sorted into cells that are a little wider than the distance asked for, so that what is near lies in
-/// the cell of a point or in one beside it.
+/// Places sorted into cells slightly larger than a distance, so everything within that distance of a point is
+/// in its own cell or a neighboring one.
 class CPlaceGrid
 {
 public:
-    /// Below or at 0 nothing is ever near.
+    /// With a distance of 0 or below, nothing is near anything.
     CPlaceGrid(std::span<const NormalPlace> places, float distance);
 
-    /// The sum of the normals of other meshes whose places are nearer to this one than the distance.
+    /// Returns the sum of the normals of other meshes that are closer to this place than the distance.
     Vec3 SumNear(const NormalPlace& place) const;
 
 private:
@@ -45,11 +45,11 @@ private:
     };
 
     Cell CellOf(const Vec3& point) const;
-    // Of the cells from one to another, in their order.
+    // Sums the places in a range of cells, in order.
     Vec3 SumRun(const NormalPlace& place, const Cell& first, const Cell& last) const;
 
     double m_fDistance;
-    std::vector<Entry> m_kEntries; // by cell, within a cell in the order of the places
+    std::vector<Entry> m_kEntries; // by cell; within a cell in the order of the places
 };
 
 } // namespace gw

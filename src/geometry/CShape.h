@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// A flat figure of a few points that tells whether a place in the world hits it.
+/// A flat figure of a few points that can test whether a world position hits it.
 class CShape : public CGeometry
 {
 public:
@@ -12,15 +12,15 @@ public:
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
 
-    /// By the world points; false for a shape that lacks them, as files may have it.
+    /// Tests the world points; false for a shape without enough points, as files may have.
     virtual bool HitTest(const Vec3& worldPoint) = 0;
-    /// The mean of the points, in model space; the origin for none.
+    /// Computes the mean of the points, in model space; the origin without points.
     virtual void GetCenter(Vec3& center);
-    /// The mean of the world points.
+    /// Computes the mean of the world points.
     virtual void GetWorldCenter(Vec3& center);
 };
 
-/// A line between two points. It is hit within 5 units beside it, ends not counted.
+/// A line between two points. Positions within 5 units beside it hit, excluding its ends.
 class CLine : public CShape
 {
 public:
@@ -45,10 +45,10 @@ public:
     uint64_t GetMemoryUsed() const override;
     bool HitTest(const Vec3& worldPoint) override;
 
-    float m_fRadius = 0.0f; ///< in world units, whatever the matrix
+    float m_fRadius = 0.0f; ///< in world units, regardless of the matrix
 };
 
-/// A convex outline of four points, seen along Z.
+/// A convex quadrilateral seen along Z.
 class CRectangle : public CShape
 {
 public:
@@ -57,7 +57,7 @@ public:
     CRectangle() { SetPointCount(4); }
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override { return new CRectangle(*this); }
-    /// A place on an edge misses.
+    /// A position on an edge does not hit.
     bool HitTest(const Vec3& worldPoint) override;
 };
 

@@ -1,3 +1,6 @@
+// The older skin: entries are stored per point, and each point is transformed once per bone. The points
+// stay in file order until Link has resolved their ids, and are then sorted by index.
+
 #include "CSkinBoneControl.h"
 
 #include "CFieldArchive.h"
@@ -14,7 +17,7 @@ const CRTTI CSkinBoneControl::ms_kRTTI{"CSkinBoneControl", &CControl::ms_kRTTI};
 
 namespace {
 
-// Where points are put together; shared by all skins of the process and kept between updates.
+// Scratch space for points; shared by all skins of the process and kept between updates.
 std::vector<Vec3>& Scratch(size_t count)
 {
     static std::vector<Vec3> scratch;
@@ -55,7 +58,7 @@ uint64_t CSkinBoneControl::GetMemoryUsed() const
     return bytes;
 }
 
-// Link ids are resolved in the order of the file, so its points are sorted after that.
+// Link ids are resolved in file order, so points are sorted afterwards.
 void CSkinBoneControl::Link(COrrinStream& stream, CLinkRecord& record)
 {
     CControl::Link(stream, record);

@@ -11,17 +11,18 @@ namespace gw {
 class CGeometry;
 class CSpatial;
 
-/// Moves the points of its target, a geometry, with bones, point by point: a point goes with each of its
-/// bones and the places are blended. The slower kind of skin, kept for files that use it.
+/// Moves the points of its target, a geometry, with bones: each point is transformed by each of its bones and
+/// the results are blended. The slower kind of skin, kept for files that use it.
 class CSkinBoneControl : public CControl
 {
 public:
-    /// How one bone moves a point.
+    /// The influence of one bone on a point.
     struct Entry
     {
         Watch<CSpatial> m_pkBone;
-        float m_fWeight = 0.0f;         ///< those of a point are to sum to 1; nothing makes up for it
-        Mat4 m_kOffset = kMat4Identity; ///< from the mesh's model space to the bone's
+        /// the weights of a point should sum to 1; a remainder is not made up
+        float m_fWeight = 0.0f;
+        Mat4 m_kOffset = kMat4Identity; ///< from the mesh's model space to the bone's space
     };
     struct Point
     {
@@ -39,18 +40,20 @@ public:
     void Fields(CFieldArchive& archive) override;
     void Link(COrrinStream& stream, CLinkRecord& record) override;
     uint64_t GetMemoryUsed() const override;
-    /// A point without an entry collapses to the origin. False where it is off or its target is no geometry.
+    /// Points without entries collapse to the origin. Returns false if it is inactive or its target is not a
+    /// geometry.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
-    /// Goes over to the nodes of the same names under a root. Entries of a bone that has none are gone.
+    /// Switches to the nodes with the same names under a root. Entries of a bone without such a node are
+    /// removed.
     bool Bind(CObject& root) override;
-    /// Goes over to the copies of the bones; entries of a bone without a copy are gone.
+    /// Switches to the copies of the bones. Entries of a bone without a copy are removed.
     bool Rebind(const CCloneMap& map) override;
 
-    /// Adds an influence in front of the others of its point.
+    /// Adds an influence before the others of its point.
     void AddInfluence(CSpatial& bone, uint32_t point, float weight, const Mat4& offset);
 
-    /// In ascending order of their indices, each once.
+    /// Returns the points in ascending order of index, each once.
     const std::vector<Point>& Points() const { return m_kPoints; }
 
 private:

@@ -1,3 +1,8 @@
+// Triangle meshes have separate indices per corner for points, normals, colors and texture coordinates, but a
+// graphics card needs a single one. BuildVertexTable numbers each distinct combination of indices as one
+// render vertex. It sorts the corners by their combinations, so the numbering depends only on the index
+// lists.
+
 #include "CTriMesh.h"
 
 #include "CFieldArchive.h"
@@ -15,10 +20,10 @@ const CRTTI CTriMesh::ms_kRTTI{"CTriMesh", &CGeometry::ms_kRTTI};
 
 namespace {
 
-// The index lists that tell render vertices apart, each with an entry for every corner.
+// The index lists that distinguish render vertices, with one entry per corner.
 using IndexLists = std::vector<std::span<const uint32_t>>;
 
-// Whether the indices of corner a come before those of b, list by list and as signed numbers.
+// Compares the indices of corners a and b, list by list, as signed numbers.
 bool ComesBefore(const IndexLists& lists, uint32_t a, uint32_t b)
 {
     for (const auto& list : lists)
@@ -29,7 +34,7 @@ bool ComesBefore(const IndexLists& lists, uint32_t a, uint32_t b)
     return false;
 }
 
-// The same for a single list of values below the number of corners, as every bone has it.
+// Same for a single list of values below the number of corners, which is the case for every bone.
 std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uint32_t> vertices)
 {
     std::vector<uint32_t> cornerOf;
@@ -50,8 +55,8 @@ std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uin
     return cornerOf;
 }
 
-// Numbers the distinct corners in their order. Each corner's number goes to `vertices`; the answer has for
-// each number a corner that carries it.
+// Numbers the distinct corners in sorted order and stores each corner's number in `vertices`. Returns one
+// corner for each number.
 std::vector<uint32_t> NumberCorners(const IndexLists& lists, std::span<uint32_t> vertices)
 {
     const auto isBelow = [&](uint32_t value) { return value < vertices.size(); };
@@ -70,7 +75,7 @@ std::vector<uint32_t> NumberCorners(const IndexLists& lists, std::span<uint32_t>
     return cornerOf;
 }
 
-// Gives each render vertex the index of its corner; a list that takes no part has no vertices.
+// Sets each render vertex to the index of its corner; a list that does not take part has no vertices.
 void TakeIndices(std::span<const uint32_t> list, std::span<const uint32_t> cornerOf,
                  std::span<uint32_t> vertices)
 {
@@ -171,7 +176,7 @@ void CTriMesh::UpdateWorldNormals()
         const uint32_t* p = &m_kXYZTriIndex[corner];
         if (std::max({p[0], p[1], p[2]}) >= points.size())
             continue;
-        // Not normalised: it weights by twice the triangle's area.
+        // Not normalized: this weights by twice the triangle's area.
         const Vec3 normal = Vec3Cross(points[p[1]] - points[p[0]], points[p[2]] - points[p[0]]);
         for (size_t k = corner; k < corner + 3; ++k)
         {
@@ -229,15 +234,14 @@ void CTriMesh::BuildVertexTable()
     std::vector<CTriMeshUVWMap*> maps;
     for (const auto& map : m_apkUVWMap)
     {
-        // A map has a triangle count of its own: one that is too short has nothing to say for the last
-        // corners.
+        // A map has its own triangle count. If it is too short, it has no coordinates for the last corners.
         if (!map || map->UVWTriIndexBuffer().size() < cornerCount)
             continue;
         maps.push_back(map.Get());
         lists.emplace_back(map->UVWTriIndexBuffer());
     }
     if (lists.empty())
-        return; // a triangle count without a list stands for no corner
+        return; // a triangle count without a list
 
     m_kVertexTriIndex.resize(cornerCount);
     const std::vector<uint32_t> cornerOf = NumberCorners(lists, m_kVertexTriIndex);

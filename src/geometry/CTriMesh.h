@@ -6,7 +6,7 @@ namespace gw {
 
 class CTriMeshUVWMap;
 
-/// A run of triangles with one attribute. Carried through files and copies; nothing here computes any.
+/// A range of triangles with one attribute. Preserved in files and copies, never computed here.
 struct AttributeRange
 {
     int32_t m_iID = 0;
@@ -14,8 +14,8 @@ struct AttributeRange
     int32_t m_iFaceCount = 0;
 };
 
-/// Triangles with separate index lists for points, normals, colours and texture coordinates, and the flat
-/// table of render vertices that follows from them. A mesh without triangles is legal.
+/// Triangles with separate index lists for points, normals, colors and texture coordinates, and the derived
+/// table of render vertices. A mesh may have no triangles.
 class CTriMesh : public CGeometry
 {
 public:
@@ -32,29 +32,29 @@ public:
     bool Update(float time) override;
     bool UpdateRange(uint32_t range, float time) override;
     void Render(CRenderer& renderer) override;
-    /// Sums the triangles' normals, weighted by area, and normalises; a normal that only flat triangles touch
-    /// is zero.
+    /// Computes each normal as the area-weighted sum of its triangles' normals, normalized. A normal used
+    /// only by degenerate triangles is zero.
     void UpdateWorldNormals() override;
 
-    /// Drops all triangles with their lists and maps, then makes index lists for the blocks that are there:
-    /// points, normals, colours. Returns false, and changes nothing, below 1 or if there is not enough
-    /// memory.
+    /// Discards all triangles with their lists and maps, then creates index lists for the existing blocks:
+    /// points, normals, colors. Returns false and changes nothing if the count is below 1 or there is not
+    /// enough memory.
     bool SetTriangleQuantity(int32_t count);
-    /// Gives each triangle a material id, or a smoothing mask, of 0; false when there are no triangles.
+    /// Assigns each triangle a material id, or a smoothing mask, of 0; false if there are no triangles.
     bool CreateTriangleMtlID();
     bool CreateSmoothFlag();
-    /// Makes each distinct combination of a corner's indices one render vertex, numbered in the order of the
-    /// combinations as signed numbers. To be run when the index lists are final.
+    /// Makes each distinct combination of a corner's indices one render vertex, sorted by the combinations as
+    /// signed numbers. Call it when the index lists are final.
     void BuildVertexTable();
 
-    /// As told by the file or the last sizing. The lists below have as many entries, three times as many, or
-    /// none.
+    /// Returns the triangle count as stored in the file or set last. The lists below have that many entries,
+    /// three times as many, or none.
     int32_t GetTriangleQuantity() const { return m_iTriangleCount; }
-    std::span<uint32_t> TriangleMtlID() { return m_kTriangleMtlID; }   ///< one for each triangle
-    std::span<uint32_t> SmoothFlag() { return m_kSmoothFlag; }         ///< smoothing groups of each triangle
-    std::span<uint32_t> XYZTriIndexBuffer() { return m_kXYZTriIndex; } ///< three points for each triangle
+    std::span<uint32_t> TriangleMtlID() { return m_kTriangleMtlID; }   ///< one per triangle
+    std::span<uint32_t> SmoothFlag() { return m_kSmoothFlag; }         ///< smoothing groups per triangle
+    std::span<uint32_t> XYZTriIndexBuffer() { return m_kXYZTriIndex; } ///< three points per triangle
     std::span<uint32_t> NormalTriIndexBuffer() { return m_kNormalTriIndex; } ///< three normals
-    std::span<uint32_t> ColorTriIndexBuffer() { return m_kColorTriIndex; }   ///< three colours
+    std::span<uint32_t> ColorTriIndexBuffer() { return m_kColorTriIndex; }   ///< three colors
     std::span<uint32_t> VertexTriIndexBuffer() { return m_kVertexTriIndex; } ///< three render vertices
 
     std::vector<Held<CTriMeshUVWMap>> m_apkUVWMap; ///< entries may be null
@@ -70,7 +70,7 @@ private:
     std::vector<uint32_t> m_kNormalTriIndex;
     std::vector<uint32_t> m_kColorTriIndex;
     std::vector<uint32_t> m_kVertexTriIndex;
-    int32_t m_iTriangleCount = 0; // as files have it: it may stand without a block, and then bounds nothing
+    int32_t m_iTriangleCount = 0; // as stored in files; without a block it limits nothing
 };
 
 } // namespace gw

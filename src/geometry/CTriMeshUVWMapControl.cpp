@@ -33,7 +33,7 @@ bool CTriMeshUVWMapControl::Update(float time)
     return true;
 }
 
-// Of frames that are missing the last one that is whole stands in.
+// If the frame is missing, the last complete one is shown.
 void CTriMeshUVWMapControl::ShowFrame(CTriMeshUVWMap& map, size_t frame) const
 {
     const std::span<Vec3> coordinates = map.UVWBuffer();

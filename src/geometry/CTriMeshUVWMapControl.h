@@ -10,8 +10,7 @@ namespace gw {
 
 class CTriMeshUVWMap;
 
-/// Plays frames of texture coordinates on its target, a map of a mesh. Frames change at once, with nothing
-/// between them.
+/// Plays frames of texture coordinates on its target, a mesh's map, without blending between frames.
 class CTriMeshUVWMapControl : public CControl
 {
 public:
@@ -21,12 +20,12 @@ public:
     CObject* CreateClone() const override { return new CTriMeshUVWMapControl(*this); }
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// False where it is off or its target is no map.
+    /// Returns false if it is inactive or its target is not a map.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
 
-    std::vector<Vec3> m_kFrames;    ///< one frame behind the other, each as long as the target's coordinates
-    std::vector<float> m_kKeyTimes; ///< ascending, one for each frame
+    std::vector<Vec3> m_kFrames;    ///< consecutive frames, each as long as the target's coordinates
+    std::vector<float> m_kKeyTimes; ///< ascending, one per frame
 
 private:
     void ShowFrame(CTriMeshUVWMap& map, size_t frame) const;

@@ -18,7 +18,8 @@
 namespace gw {
 namespace {
 
-// The bone meshes are absent on purpose: they can be written, and a file that holds one cannot be read back.
+// The bone meshes are left out on purpose: they can be written, but a file that contains one cannot be read
+// back.
 constexpr FactoryRow kClasses[] = {
     {&CGeometry::ms_kRTTI,             MakeNothing                      },
     {&CTriMesh::ms_kRTTI,              MakeObject<CTriMesh>             },
@@ -43,7 +44,7 @@ constexpr FactoryRow kClasses[] = {
 } // namespace
 
 extern "C" {
-// The linker is told to want this name, so that the table is part of every program that links the room.
+// The linker requires this name, so the table is part of every program that links this room.
 extern const int gw_geometry_classes;
 const int gw_geometry_classes = RegisterClasses(kClasses);
 }

@@ -7,8 +7,8 @@
 
 namespace gw {
 
-/// Replaces a block by `count` zeros. False, with the old block kept, if there is not enough memory; a count
-/// of 0 or below leaves an empty block.
+/// Replaces a block by `count` zeros, or empties it if the count is 0 or below. Returns false and keeps the
+/// old block if there is not enough memory.
 template <class T>
 bool MakeBlock(std::vector<T>& block, int64_t count)
 {

@@ -9,14 +9,14 @@ namespace gw {
 
 class CSpatial;
 
-/// Bones under a root by the names of others, to be asked often.
+/// Finds bones under a root by the names of other bones, for repeated queries.
 class CBonesByName
 {
 public:
     explicit CBonesByName(CObject& root) : root_(root) {}
 
-    /// The first node that has a bone's name, derived classes included; null for no bone, a bone without a
-    /// name and a name that is not there.
+    /// Returns the first node with a bone's name, derived classes included; null if the bone is null or
+    /// unnamed, or the name is not found.
     CSpatial* Find(const CSpatial* bone);
 
 private:
@@ -24,7 +24,7 @@ private:
     std::unordered_map<const CSpatial*, CSpatial*> m_kFound;
 };
 
-/// The copies that cloning has made, to be asked often.
+/// Finds the copies that cloning has made, for repeated queries.
 class CCopies
 {
 public:

@@ -1,3 +1,6 @@
+// Draws part of a picture onto another. Both rectangles are clipped in 64 bits, one dimension at a time; then
+// each row is drawn by a function chosen by the two pixel formats.
+
 #include "Blit.h"
 
 #include <algorithm>
@@ -9,7 +12,7 @@ namespace {
 
 constexpr int32_t kBlitFormats = 2;
 
-// The bytes of a pixel in the formats that can be drawn.
+// Bytes per pixel of the drawable formats.
 constexpr int32_t kBGRA = 4;
 constexpr int32_t kBGR = 3;
 
@@ -50,13 +53,13 @@ void DrawRow(uint8_t* to, const uint8_t* from, int32_t count, uint32_t opacity)
 
 using CDrawRow = void (*)(uint8_t* to, const uint8_t* from, int32_t count, uint32_t opacity);
 
-// By the formats of destination and source.
+// Indexed by the formats of destination and source.
 constexpr CDrawRow kDrawRow[kBlitFormats][kBlitFormats] = {
     {DrawRow<kBGRA, kBGRA>, DrawRow<kBGRA, kBGR>},
     {DrawRow<kBGR,  kBGRA>, DrawRow<kBGR,  kBGR>},
 };
 
-// One dimension of what is drawn, cut to both pictures. Computed in 64 bits: places may be anything.
+// One dimension of the drawn part, clipped to both pictures. In 64 bits, because positions can be any number.
 struct Extent
 {
     int64_t to;
@@ -95,7 +98,7 @@ bool Blit(CPixelBuffer& destination, int32_t x, int32_t y, const CPixelBuffer& s
         return false;
     if (&destination == &source)
     {
-        // Rows may overlap: draw from how they were.
+        // Rows can overlap, so draw from a copy.
         const CPixelBuffer before(source);
         return Blit(destination, x, y, before, sourceX, sourceY, width, height, opacity);
     }

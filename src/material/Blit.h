@@ -4,12 +4,12 @@
 
 namespace gw {
 
-/// An opacity, or a byte of alpha, that lets nothing through.
+/// Full opacity, and the alpha byte of an opaque pixel.
 inline constexpr uint8_t kOpaque = 255;
 
-/// Draws a part of a picture on another one, cut to both. Opacity goes from 0, which changes nothing, to 255,
-/// which copies; between them every byte of a pixel is mixed. Pixels without alpha count as opaque. False for
-/// formats other than 0 and 1, and where pixels cannot be mapped.
+/// Draws part of a picture onto another, clipped to both. Opacity 0 changes nothing, 255 copies; in between,
+/// every byte is blended. Pixels without alpha count as opaque. Returns false for formats other than 0 and 1,
+/// and if pixels cannot be mapped.
 bool Blit(CPixelBuffer& destination, int32_t x, int32_t y, const CPixelBuffer& source, int32_t sourceX,
           int32_t sourceY, int32_t width, int32_t height, uint8_t opacity);
 

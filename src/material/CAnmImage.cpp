@@ -10,7 +10,7 @@ const CRTTI CAnmImage::ms_kRTTI{"CAnmImage", &CObject::ms_kRTTI};
 
 namespace {
 
-// Three bytes that a file stores as a word; the fourth has no place here.
+// Three bytes that are stored as a word; the fourth is not kept.
 void FlagField(CFieldArchive& archive, std::array<uint8_t, 3>& flags)
 {
     uint32_t word = flags[0] | uint32_t{flags[1]} << 8 | uint32_t{flags[2]} << 16;
@@ -65,7 +65,7 @@ bool CAnmImage::Register(COrrinStream& stream)
     return CObject::Register(stream);
 }
 
-// The frames of a linked film stand in no list of fields, since no file holds them.
+// The frames of a linked film are not in the field list, because files do not contain them.
 void CAnmImage::CloneHeld(CCloneMap& map, CObject& copy)
 {
     CObject::CloneHeld(map, copy);

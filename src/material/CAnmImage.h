@@ -11,18 +11,18 @@ namespace gw {
 
 class CImage;
 
-/// One picture of a film.
+/// One frame of a film.
 struct FilmFrame
 {
     uint32_t m_uiTiming = 0; ///< stored and copied only
     uint32_t m_uiDelay = 0;  ///< hundredths of a second until the next frame
-    int32_t m_iLeft = 0;     ///< where the picture lies
+    int32_t m_iLeft = 0;     ///< position of the picture
     int32_t m_iTop = 0;
     std::array<uint8_t, 3> m_abyFlags{}; ///< stored and copied only
     Held<CImage> m_spkImage;             ///< may be null
 };
 
-/// A film: a list of frames that lie at their places on the screen, or a link to an animated picture file.
+/// A film: a list of frames with positions on the screen, or a link to an animated picture file.
 class CAnmImage : public CObject
 {
 public:
@@ -34,26 +34,26 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
-    /// Besides follows a link as an image does.
+    /// Also resolves a link, like CImage.
     void Load(COrrinStream& stream, CLinkRecord& record) override;
-    /// Besides settles the name under which a link is stored in the stream's folder.
+    /// Also determines the name under which the stream's folder stores the link.
     bool Register(COrrinStream& stream) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Reads all frames of an animated file, each into its own image. False, with an empty film, if it cannot
-    /// be read or there is no room for it.
+    /// Reads all frames of an animated file, each into its own image. Returns false, with an empty film, if
+    /// it cannot be read or there is not enough memory.
     bool Load(const std::string& path, PictureMemory* memory = nullptr);
 
     size_t GetFrameCount() const { return m_kFrames.size(); }
-    /// The frame; out of range one without an image.
+    /// Returns a frame; out of range, one without an image.
     const FilmFrame& GetFrame(size_t index) const;
-    /// Takes a frame over with its image.
+    /// Appends a frame with its image.
     void AddFrame(FilmFrame&& frame) { m_kFrames.push_back(std::move(frame)); }
 
-    /// The file that the film stands for, or null for an embedded one.
+    /// Returns the linked file, or null for an embedded film.
     const char* GetLinkFileName() const { return m_kLink.GetFileName(); }
     CPictureLink& PictureLink() { return m_kLink; }
-    /// Null or an empty text make the film an embedded one. Nothing is read.
+    /// Sets the linked file without reading it. Null or empty text embeds the film.
     void SetLinkFileName(const char* name) { m_kLink.Set(name, *this); }
 
 protected:

@@ -11,9 +11,9 @@ const CRTTI CAnmImageControl::ms_kRTTI{"CAnmImageControl", &CControl::ms_kRTTI};
 
 namespace {
 
-constexpr float kDelayUnit = 10.0f; // hundredths of a second in thousandths
+constexpr float kDelayUnit = 10.0f; // hundredths to thousandths of a second
 
-// When each frame begins. A frame waits for its own delay, not for that of the one before it.
+// Returns the start time of each frame. A frame waits for its own delay, not for that of the previous frame.
 std::vector<float> FrameTimes(const CAnmImage& film)
 {
     std::vector<float> times(film.GetFrameCount());

@@ -8,7 +8,7 @@ namespace gw {
 class CAnmImage;
 class CImage;
 
-/// Plays a film on its target, an image: each frame is drawn at its place when its time has come.
+/// Plays a film on its target, an image: each frame is drawn at its position when its time comes.
 class CAnmImageControl : public CControl
 {
 public:
@@ -21,7 +21,8 @@ public:
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
-    /// Times are thousandths of a second. False where it is off, has no film, or its target is no image.
+    /// Times are in milliseconds. Returns false if it is inactive, has no film, or its target is not an
+    /// image.
     bool Update(float time) override;
     bool UpdateTransform(float) override { return false; }
 

@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// Two materials that a mask blends.
+/// Two materials blended by a mask.
 class CBlendMaterial : public CMaterial
 {
 public:
@@ -23,7 +23,7 @@ public:
 
     float m_fBlend = 0.0f;
     Held<CMaterialBase> m_spkMask;
-    std::array<Held<CMaterialBase>, 2> m_aspkMtl; ///< may be the same one, and null
+    std::array<Held<CMaterialBase>, 2> m_aspkMtl; ///< may be equal or null
 };
 
 } // namespace gw

@@ -1,3 +1,7 @@
+// Images: embedded as a JPEG or as plain pixels, or linked to a file. A JPEG is decoded when its pixels are
+// first needed and encoded when the image is measured or saved, so an image that is only copied is never
+// decoded.
+
 #include "CImage.h"
 
 #include "CFieldArchive.h"
@@ -87,7 +91,7 @@ uint64_t CImage::GetMemoryUsed() const
 
 uint64_t CImage::GetDiskUsed() const
 {
-    const_cast<CImage*>(this)->MakeJPEG(); // what is stored has no other size before it is made
+    const_cast<CImage*>(this)->MakeJPEG(); // the stored size is unknown until the JPEG is encoded
     return CObject::GetDiskUsed();
 }
 

@@ -9,8 +9,8 @@
 
 namespace gw {
 
-/// A raster in memory, stored in the container as the bytes of a JPEG file or plainly, or a link to a picture
-/// file, of which the container holds the name only.
+/// A raster image, stored in the container as a JPEG or as plain pixels, or a link to a picture file, of
+/// which the container stores only the name.
 class CImage : public CObject
 {
 public:
@@ -22,33 +22,35 @@ public:
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override;
     void Fields(CFieldArchive& archive) override;
-    /// Besides follows a link: to an image that has the same file already, which then takes this one's place,
-    /// else to the file. A file that cannot be read leaves an empty image and a note beside the container.
+    /// Also resolves a link: to an existing image of the same file, which then replaces this one, otherwise
+    /// to the file. If the file cannot be read, the image is empty and a note is written next to the
+    /// container.
     void Load(COrrinStream& stream, CLinkRecord& record) override;
-    /// Besides settles the name under which a link is stored in the stream's folder.
+    /// Also determines the name under which the stream's folder stores the link.
     bool Register(COrrinStream& stream) override;
-    /// Without a GetDiskUsed before it, a JPEG that is not there yet is written as none.
+    /// Call GetDiskUsed first; otherwise a JPEG that is not encoded yet is written empty.
     void Save(COrrinStream& stream) override;
     uint64_t GetMemoryUsed() const override;
-    /// Makes the JPEG that Save writes. A picture that can be none is stored plainly from then on.
+    /// Encodes the JPEG that Save writes. If that is not possible, the image is stored as plain pixels from
+    /// then on.
     uint64_t GetDiskUsed() const override;
 
-    /// Reads a picture file into the pixels. False, with an empty image, if it cannot be read or there is no
-    /// room for it.
+    /// Reads a picture file into the pixels. Returns false, with an empty image, if it cannot be read or
+    /// there is not enough memory.
     bool Load(const std::string& path, PictureMemory* memory = nullptr);
-    /// Writes a picture file of the format that its extension tells; quality goes from 1 to 100.
+    /// Writes a picture file in the format of its extension; quality is 1 to 100.
     bool Save(const std::string& path, int32_t quality);
 
-    /// The file that the image stands for, or null for an embedded one.
+    /// Returns the linked file, or null for an embedded image.
     const char* GetLinkFileName() const { return m_kLink.GetFileName(); }
     CPictureLink& PictureLink() { return m_kLink; }
-    /// Null or an empty text make the image an embedded one. Nothing is read.
+    /// Sets the linked file without reading it. Null or empty text embeds the image.
     void SetLinkFileName(const char* name) { m_kLink.Set(name, *this); }
 
-    /// The pixels; those of a JPEG are decoded at the first call.
+    /// Returns the pixels; a JPEG is decoded at the first call.
     CPixelBuffer& Pixels();
 
-    bool m_bJPEG = true; ///< whether an embedded image is stored as JPEG, which keeps no alpha
+    bool m_bJPEG = true; ///< store an embedded image as JPEG, which loses alpha
 
 private:
     bool IsJPEGCurrent() const { return !m_kJPEG.empty() && m_uiJPEGRevision == m_kPixels.GetRevision(); }
@@ -56,8 +58,8 @@ private:
 
     CPictureLink m_kLink;
     CPixelBuffer m_kPixels;
-    std::vector<uint8_t> m_kJPEG;  // as read, or made for one Save
-    uint32_t m_uiJPEGRevision = 0; // the pixels that the bytes belong to
+    std::vector<uint8_t> m_kJPEG;  // as read, or encoded for one Save
+    uint32_t m_uiJPEGRevision = 0; // revision of the pixels that these bytes encode
     bool m_bDecoded = true;
     bool m_bMadeForSave = false;
 };

@@ -4,7 +4,7 @@ namespace gw {
 
 namespace {
 
-// Built before main, so that it outlives every image that is made later.
+// Created before main, so it outlives every image.
 [[maybe_unused]] const CImageCache& kBuiltAtStart = CImageCache::Instance();
 
 } // namespace

@@ -8,14 +8,14 @@ namespace gw {
 
 class CObject;
 
-/// The linked images and films that are alive, by the path of their file, so that each file is read once. One
-/// for the process; it keeps nothing alive.
+/// The living linked images and films by file path, so that each file is read once. One per process; it keeps
+/// nothing alive.
 class CImageCache
 {
 public:
     static CImageCache& Instance();
 
-    /// The first object of a class under exactly this path, or null.
+    /// Returns the first object of a class with exactly this path, or null.
     template <class T>
     T* Find(std::string_view path) const
     {
@@ -27,11 +27,11 @@ public:
         }
         return nullptr;
     }
-    /// Several objects may stand under one path.
+    /// Adds an object; a path can have several.
     void Enter(std::string_view path, CObject& image) { m_kImages.emplace(path, &image); }
-    /// Removes an object from under a path.
+    /// Removes one object of a path.
     void Remove(std::string_view path, const CObject* image);
-    /// Removes all that stand under a path.
+    /// Removes all objects of a path.
     void RemoveAll(std::string_view path);
 
 private:

@@ -4,8 +4,7 @@
 
 namespace gw {
 
-/// What a mesh points at for its looks. No shading is computed here: materials are stored, copied and handed
-/// on.
+/// The appearance of a mesh. Nothing is shaded here: materials are only stored and copied.
 class CMaterialBase : public CObject
 {
 public:
@@ -23,7 +22,7 @@ protected:
     CMaterialBase(const CMaterialBase& source) = default;
 };
 
-/// The base of the materials that are no textures.
+/// Base of the materials that are not textures.
 class CMaterial : public CMaterialBase
 {
 public:

@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// A list of materials, for meshes whose triangles name one each.
+/// A list of materials, for meshes with a material per triangle.
 class CMultiMaterial : public CMaterial
 {
 public:
@@ -21,7 +21,7 @@ public:
     void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Drops every entry; as many null ones stand then.
+    /// Discards all entries and creates that many null ones.
     void SetSubMaterialCount(size_t count);
 
     std::vector<Held<CMaterialBase>> m_kSubMaterials; ///< entries may be null

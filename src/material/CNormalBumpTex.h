@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// Two textures that bend the normals together.
+/// Two textures that perturb normals together.
 class CNormalBumpTex : public CTexture
 {
 public:

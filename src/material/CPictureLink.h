@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// The picture file that an object stands for instead of having pixels of its own in the container.
+/// The picture file that an object refers to instead of storing pixels in the container.
 class CPictureLink
 {
 public:
@@ -18,29 +18,30 @@ public:
     CPictureLink& operator=(const CPictureLink&) = delete;
 
     bool IsNull() const { return m_pcFileName.IsNull(); }
-    /// Whether the file was left unread by the load that found the link. Setting a name clears it.
+    /// Returns whether the load that found the link did not read the file. Setting a name clears this.
     bool IsUnread() const { return m_bUnread; }
     void SetUnread(bool unread) { m_bUnread = unread; }
     const char* GetFileName() const { return m_pcFileName.Get(); }
     std::string_view View() const { return m_pcFileName.View(); }
     size_t MemoryUsed() const { return m_pcFileName.MemoryUsed(); }
-    /// Null and an empty text mean no link. The owner no longer stands in the cache under its old name.
+    /// Sets the file name; null or empty removes the link. The owner's cache entry for the old name is
+    /// removed.
     void Set(const char* name, const CObject& owner);
 
-    /// The name as a stored field: what Settle made of it, else as it is.
+    /// The name as a stored field: the settled one if there is one, otherwise as it is.
     void Field(CFieldArchive& archive);
-    /// Finds the name under which a container in the stream's folder stores the link.
+    /// Determines the name under which a container in the stream's folder stores the link.
     void Settle(const COrrinStream& stream);
 
 private:
     CText m_pcFileName;
-    CText m_pcStoredName; // null until a stream has told its folder
+    CText m_pcStoredName; // null until a stream's folder is known
     bool m_bUnread = false;
 };
 
 /// Reads the file of a linked picture, unless an earlier load has. If the scene's pictures take too much
-/// memory, this one stays unread, with a warning. A file that cannot be read leaves a note beside the
-/// container.
+/// memory, the picture is not read and a warning is recorded. If the file cannot be read, a note is written
+/// next to the container.
 template <class T>
 void ReadLinkedFile(T& picture, COrrinStream& stream)
 {
@@ -58,13 +59,13 @@ void ReadLinkedFile(T& picture, COrrinStream& stream)
 
 /// The last step of loading a linked picture: resolves the stored name to a path and reads the file. If a
 /// picture of the same class already has this path, it replaces the new one in the stream, and the new one is
-/// destroyed. In a stream without a folder the name stays as it is.
+/// destroyed. If the stream has no folder, the name is not changed.
 template <class T>
 void FollowLink(T& picture, COrrinStream& stream, CLinkRecord& record)
 {
     const char* stored = picture.GetLinkFileName();
     const std::string name(stored ? stored : "");
-    picture.SetLinkFileName(nullptr); // a name may begin with the zero byte that ends it
+    picture.SetLinkFileName(nullptr); // a stored name can start with a zero byte, which makes it empty
     if (name.empty() || stream.Record().Failure())
         return;
     if (!stream.HasBaseDirectory())

@@ -1,3 +1,7 @@
+// Pixel memory. A block is on the heap, in the temp store, or owned by somebody else; all three are accessed
+// between Lock and Unlock only. Sizes come from files, so every size is checked before memory is allocated,
+// and a failed operation changes nothing.
+
 #include "CPixelBuffer.h"
 
 #include "CFieldArchive.h"
@@ -12,11 +16,11 @@ namespace gw {
 
 namespace {
 
-// Behind the last pixel there is room to read it as a word, whatever its size.
+// The last pixel can be read as a word, whatever its size.
 constexpr int64_t kWordBytes = 4;
 constexpr int64_t kBlockLimit = std::numeric_limits<int32_t>::max();
 
-// The size of a picture's block, or 0 where there can be none.
+// Returns the size of a picture's block, or 0 if the layout is invalid.
 size_t BlockBytes(const CPixelLayout& layout)
 {
     const int64_t stride = layout.Stride();
@@ -25,7 +29,7 @@ size_t BlockBytes(const CPixelLayout& layout)
     return static_cast<size_t>(stride * layout.m_iHeight - BytesPerPixel(layout.m_iFormat) + kWordBytes);
 }
 
-// Doubles what is filled until all is. The first `filled` bytes are the pattern.
+// Fills a block with a pattern, its first `filled` bytes, by doubling the filled part.
 void Repeat(uint8_t* bytes, size_t filled, size_t byteCount)
 {
     while (filled < byteCount)
@@ -100,7 +104,7 @@ bool CPixelBuffer::IsSame(const CPixelLayout& layout) const
            layout.m_iFormat == m_kLayout.m_iFormat && layout.Stride() == m_kLayout.Stride();
 }
 
-// A heap block is all zeros; a block of the temp store holds what an earlier one left.
+// A new heap block is zeroed; a block of the temp store can contain old data.
 bool CPixelBuffer::Allocate(const CPixelLayout& layout)
 {
     const size_t byteCount = BlockBytes(layout);
@@ -204,7 +208,7 @@ void CPixelBuffer::Fields(CFieldArchive& archive)
 {
     if (archive.IsReading())
         return ReadPixels(archive);
-    // Only read, by an archive that takes what it reads and what it fills alike.
+    // Only read, but the archive interface takes non-const bytes.
     const CPixelAccess<const CPixelBuffer, uint8_t> view(*this);
     if (!view && !IsEmpty())
         archive.Refuse(EFailure::OutOfMemory);

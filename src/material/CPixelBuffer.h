@@ -14,38 +14,40 @@ namespace gw {
 
 class CFieldArchive;
 
-/// Where pixels are kept, as files have it.
+/// Where pixels are kept, as stored in files.
 enum class EPixelStorage : uint16_t
 {
     Heap,
     TempStore, ///< in the process's temp store, mapped only while locked
-    Foreign,   ///< somebody else owns them; never freed nor resized here
+    Foreign,   ///< owned by somebody else; never freed or resized here
 };
 
-/// A raster of pixels. Its bytes are reached through CPixelLock and CPixelView only. No operation throws; one
-/// that answers false leaves everything as it was.
+/// A raster of pixels, accessed only through CPixelLock and CPixelView. Operations do not throw; if one
+/// returns false, nothing has changed.
 class CPixelBuffer
 {
 public:
     CPixelBuffer() = default;
-    /// A copy on the heap or in the temp store, empty where there is no room for it.
+    /// Copies to the heap or the temp store; empty if there is not enough memory.
     CPixelBuffer(const CPixelBuffer& source);
     CPixelBuffer& operator=(const CPixelBuffer&) = delete;
     ~CPixelBuffer();
 
-    /// Makes a picture of one colour: `fill` points at one pixel, null means zeros. False for a size below 1,
-    /// a format that there is not, no room, a new size for foreign pixels, and while somebody holds a lock.
+    /// Creates a picture of one color: `fill` points to one pixel, null means zeros. Returns false for a size
+    /// below 1, an unknown format, too little memory, a new size for foreign pixels, and while a lock is
+    /// held.
     bool Create(int32_t width, int32_t height, int32_t format, const uint8_t* fill = nullptr);
-    /// Shows pixels of somebody else, stride x height bytes, who keeps them until this is freed or dies.
+    /// Uses somebody else's pixels, stride x height bytes, which must stay valid until this is freed or
+    /// destroyed.
     bool Attach(uint8_t* pixels, int32_t width, int32_t height, int32_t format);
-    /// Lets go of the pixels; foreign ones are only forgotten. False while somebody holds a lock.
+    /// Frees the pixels; foreign ones are only forgotten. Returns false while a lock is held.
     bool Free();
-    /// Takes over size, format, alignment, resolution and all bytes of another picture.
+    /// Copies size, format, alignment, resolution and all bytes of another picture.
     bool Copy(const CPixelBuffer& other);
 
-    /// For the next Create. False while there are pixels.
+    /// Selects the storage for the next Create. Returns false while there are pixels.
     bool SetStorage(EPixelStorage storage);
-    /// Whether rows begin at multiples of 4 bytes. False while there are pixels.
+    /// Sets whether rows start at multiples of 4 bytes. Returns false while there are pixels.
     bool SetRowAlignment(bool aligned);
     void SetResolution(int32_t horizontal, int32_t vertical);
 
@@ -57,20 +59,20 @@ public:
     size_t GetStride() const { return IsEmpty() ? 0 : static_cast<size_t>(m_kLayout.Stride()); }
     const CPixelLayout& Layout() const { return m_kLayout; }
     EPixelStorage GetStorage() const { return m_eStorage; }
-    uint32_t GetHandle() const { return m_uiHandle; } ///< of the temp store's block, 0 for none
-    /// stride x height - bytes per pixel + 4, or 0 without pixels.
+    uint32_t GetHandle() const { return m_uiHandle; } ///< of the temp store's block, or 0
+    /// Returns stride x height - bytes per pixel + 4, or 0 without pixels.
     size_t GetBlockBytes() const { return m_uiBlockBytes; }
     int32_t GetLockCount() const { return m_iLocks; }
-    /// Another number whenever pixels may have changed.
+    /// Returns a number that changes whenever pixels may have changed.
     uint32_t GetRevision() const { return m_uiRevision; }
 
-    /// The first byte of the pixels, which stay where they are until Unlock; null where they cannot be mapped
-    /// and where there are none, and then no Unlock is due. Several may hold locks, in any threads.
+    /// Returns the first byte of the pixels, valid until Unlock. Returns null, and needs no Unlock, if there
+    /// are no pixels or they cannot be mapped. Several locks can be held, from any threads.
     uint8_t* Lock() const;
     void Unlock() const;
-    void Touch() { ++m_uiRevision; } ///< says that pixels are about to be changed
+    void Touch() { ++m_uiRevision; } ///< call before changing pixels
 
-    /// The stored fields, in file order. Without pixels the size is written as none.
+    /// The stored fields, in file order. Without pixels, the size is written as 0.
     void Fields(CFieldArchive& archive);
 
 private:
@@ -95,8 +97,8 @@ private:
     mutable std::atomic<int32_t> m_iLocks = 0;
 };
 
-/// Holds a lock on a picture. Row y begins at Row(y); all rows together are Bytes(). Without pixels, and
-/// where they cannot be mapped, it is false.
+/// Holds a lock on a picture. Row(y) returns the start of row y, Bytes() all rows. Converts to false if there
+/// are no pixels or they cannot be mapped.
 template <class TBuffer, class TByte>
 class CPixelAccess
 {
@@ -117,7 +119,7 @@ public:
 
     explicit operator bool() const { return m_pbyPixels != nullptr; }
     TByte* Row(int32_t y) const { return m_pbyPixels + static_cast<size_t>(y) * m_uiStride; }
-    std::span<TByte> Bytes() const&& = delete; // such a lock is gone before a loop over them begins
+    std::span<TByte> Bytes() const&& = delete; // the lock of a temporary would end before a loop starts
     std::span<TByte> Bytes() const&
     {
         return {m_pbyPixels, m_pbyPixels ? m_uiStride * static_cast<size_t>(buffer_.GetHeight()) : 0};

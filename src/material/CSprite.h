@@ -6,7 +6,7 @@ namespace gw {
 
 class CImage;
 
-/// An image with three values and a flag, which are carried through files and copies and read by nobody.
+/// An image with three values and a flag, preserved in files and copies but not used.
 class CSprite : public CObject
 {
 public:

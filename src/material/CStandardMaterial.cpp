@@ -37,7 +37,7 @@ void CStandardMaterial::Fields(CFieldArchive& archive)
     archive.Float("m_fDimMult", m_fDimMult);
     archive.Float("m_fSoftThresh", m_fSoftThresh);
 
-    // A file may store another count: all its ids are read, and those that have no place are dropped.
+    // A file can store another count: all ids are read, and excess ones are dropped.
     const size_t count = archive.Count("m_aspkTexture", kTextureChannels, 4);
     auto stored = std::span(m_aspkTexture).first(std::min(count, kTextureChannels));
     archive.LinkRow("m_aspkTexture", stored);

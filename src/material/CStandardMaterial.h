@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// What a texture of a standard material drives: its place in m_aspkTexture.
+/// What a texture of a standard material controls: its index in m_aspkTexture.
 enum ETextureChannel : uint8_t
 {
     TT_Ambient,
@@ -26,7 +26,7 @@ enum ETextureChannel : uint8_t
 };
 inline constexpr size_t kTextureChannels = 12;
 
-/// A leaf of the tree of materials: colours, parameters, and a texture for each channel.
+/// A leaf of the material tree: colors, parameters, and one texture per channel.
 class CStandardMaterial : public CMaterial
 {
 public:
@@ -42,7 +42,7 @@ public:
     uint64_t GetMemoryUsed() const override;
 
     Vec3 m_kAmbient{0.2f, 0.2f, 0.2f};
-    Vec3 m_kDiffuse{0.8f, 0.0f, 0.0f}; ///< red and not grey, on purpose
+    Vec3 m_kDiffuse{0.8f, 0.0f, 0.0f}; ///< red instead of gray, on purpose
     Vec3 m_kSpecular{0.5f, 0.5f, 0.5f};
     Vec3 m_kFilter{0.0f, 0.0f, 0.0f};
     float m_fShininess = 0.5f;

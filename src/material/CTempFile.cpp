@@ -1,3 +1,6 @@
+// Temporary files for pixel blocks. The folder is shared by all users of the machine, so it is checked not to
+// be a link, and file names are created exclusively.
+
 #include "CTempFile.h"
 
 #include "Paths.h"
@@ -16,8 +19,8 @@ namespace {
 constexpr std::string_view kNamePattern = "TK_XXXXXX.tmp";
 constexpr int kExtensionLength = 4;
 
-// Everybody on a machine may share the folder, as they share the one that it lies in. False where another one
-// has put a link or a file in its place.
+// Creates the folder that all users of the machine share, like the one that contains it. Returns false if
+// somebody has put a link or a file in its place.
 bool MakeSharedFolder(const std::string& folder)
 {
     if (!FolderExists(folder) && CreateFolder(folder))
@@ -25,7 +28,7 @@ bool MakeSharedFolder(const std::string& folder)
     return IsFolderItself(folder);
 }
 
-// Another program may remove the empty folder just before a file is made in it.
+// Another program can remove the empty folder just before the file is created.
 int CreateIn(const std::string& folder, std::string& path)
 {
     constexpr int kAttempts = 8;

@@ -8,9 +8,9 @@
 
 namespace gw {
 
-/// A temporary file whose blocks can be mapped into memory. It has its size from the start, but space on the
-/// disk is reserved block by block before anything is touched, so that a full disk is an answer. The file
-/// goes with the object. Each operation on blocks holds the file's lock throughout.
+/// A temporary file whose blocks can be mapped into memory. Its size is fixed from the start, but disk space
+/// is reserved block by block before it is touched, so that a full disk is reported as an error. The file is
+/// deleted with the object. Operations on blocks lock the file.
 class CTempFile
 {
 public:
@@ -18,23 +18,23 @@ public:
     CTempFile(const CTempFile&) = delete;
     CTempFile& operator=(const CTempFile&) = delete;
 
-    /// False where the folder took no file; nothing else may be asked then.
+    /// Returns false if the file could not be created; then call nothing else.
     bool IsOpen() const { return m_iFile >= 0; }
     uint64_t GetSize() const { return m_uiSize; }
     const std::string& GetPath() const { return m_kPath; }
-    /// Whether more than one block can be had of it.
+    /// Returns whether the file can hold more than one block.
     bool TakesBlocks() const { return m_bTakesBlocks; }
 
-    /// The index of a new block, or none where the file or the disk has no room.
+    /// Returns the index of a new block, or nothing if the file or the disk is full.
     virtual std::optional<uint32_t> Allocate(uint64_t byteCount) = 0;
-    /// Gives a block back. True when that was the last one.
+    /// Frees a block. Returns true if it was the last one.
     virtual bool Free(uint32_t block) = 0;
-    /// The address of a block, mapped at its first use; null for no such block. Uses are counted.
+    /// Returns the address of a block, mapped at its first use; null if it does not exist. Uses are counted.
     virtual std::byte* Map(uint32_t block) = 0;
     virtual void Unmap(uint32_t block) = 0;
 
 protected:
-    /// A part of the file that can be seen while somebody uses it.
+    /// A mapped part of the file.
     struct View
     {
         uint64_t m_uiOffset = 0;
@@ -43,7 +43,7 @@ protected:
         std::byte* m_pkAddress = nullptr;
     };
 
-    /// Makes a file of its own in a folder, which is made first where it is missing.
+    /// Creates a file in a folder, which is created if necessary.
     CTempFile(const std::string& folder, uint64_t byteCount, bool takesBlocks);
 
     bool Reserve(const View& view);
@@ -56,7 +56,7 @@ protected:
 private:
     std::string m_kPath;
     uint64_t m_uiSize;
-    int m_iFile = -1; // stays open: views are mapped of it later
+    int m_iFile = -1; // stays open, because views are mapped later
     bool m_bTakesBlocks;
 };
 

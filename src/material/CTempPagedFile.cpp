@@ -10,7 +10,7 @@ CTempPagedFile::~CTempPagedFile()
         Close(view);
 }
 
-// Skips past each used page that is met, so that every page is looked at once.
+// Skips past each used page that it meets, so every page is checked once.
 std::optional<uint32_t> CTempPagedFile::FirstFit(uint32_t pageCount) const
 {
     uint32_t first = 0;

@@ -7,7 +7,7 @@
 
 namespace gw {
 
-/// A temporary file of 64 MiB for many blocks, given out in pages of 64 KiB. A block's index is its first
+/// A temporary file of 64 MiB for many blocks, allocated in pages of 64 KiB. A block's index is its first
 /// page.
 class CTempPagedFile : public CTempFile
 {

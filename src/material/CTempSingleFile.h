@@ -19,7 +19,7 @@ public:
 private:
     bool IsBlock(uint32_t block) const { return block == 0 && m_kView.m_uiSize > 0; }
 
-    View m_kView; // empty until the block is given out
+    View m_kView; // empty until the block is allocated
 };
 
 } // namespace gw

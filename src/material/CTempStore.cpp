@@ -1,3 +1,6 @@
+// Handles map to blocks of temporary files. Small blocks share paged files, large ones get a file each. The
+// store deletes leftovers of killed runs when it creates its first file.
+
 #include "CTempStore.h"
 
 #include "CTempPagedFile.h"
@@ -14,7 +17,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kFileLimit = 0xffff; // index + 1 has 16 bits
+constexpr size_t kFileLimit = 0xffff; // index + 1 must fit into 16 bits
 
 std::string DefaultFolder()
 {
@@ -29,10 +32,10 @@ uint32_t HandleOf(size_t file, uint32_t block)
 
 uint32_t BlockOf(uint32_t handle)
 {
-    return (handle & 0xffff) - 1; // of a low half of 0 no file has a block
+    return (handle & 0xffff) - 1; // a low half of 0 yields an index that no block has
 }
 
-// Built before main, so that it outlives every picture that is made later.
+// Created before main, so it outlives every picture.
 [[maybe_unused]] const CTempStore& kBuiltAtStart = CTempStore::Instance();
 
 } // namespace
@@ -69,11 +72,11 @@ uint32_t CTempStore::Allocate(uint64_t byteCount)
 
 uint32_t CTempStore::AllocateInNewFile(uint64_t byteCount)
 {
-    // Compared by subtraction: a size may be anything.
+    // Compared by subtraction, because a size can be any number.
     if (m_uiLimit != 0 && (byteCount > m_uiLimit || m_uiTotal > m_uiLimit - byteCount))
         return 0;
-    // What a run that was killed left goes with the first file. Another program that is alive loses the names
-    // of its files and nothing else.
+    // Deletes the leftovers of killed runs with the first file. A running program only loses the names of its
+    // files, not the files.
     if (m_kFiles.empty())
         Purge(m_kFolder);
     const bool single = byteCount > CTempPagedFile::kFileBytes;
@@ -90,7 +93,8 @@ uint32_t CTempStore::AllocateInNewFile(uint64_t byteCount)
     return 0;
 }
 
-// The first null slot or the end of the list; kFileLimit for a file that could not be made and one too many.
+// Returns the first null slot or the end of the list; kFileLimit if the file could not be created or there
+// are too many.
 size_t CTempStore::AddFile(std::unique_ptr<CTempFile> file)
 {
     const auto slot = std::find(m_kFiles.begin(), m_kFiles.end(), nullptr);
@@ -110,7 +114,7 @@ void CTempStore::RemoveFile(size_t index)
         return;
     m_uiTotal -= m_kFiles[index]->GetSize();
     m_kFiles[index].reset();
-    rmdir(m_kFolder.c_str()); // which is refused while other files lie there
+    rmdir(m_kFolder.c_str()); // fails while the folder contains other files
 }
 
 void CTempStore::Free(uint32_t handle)

@@ -4,7 +4,8 @@
 
 namespace gw {
 
-/// The base of what fills a channel of a material. A texture is a material so that it can be two-sided too.
+/// Base of whatever fills a channel of a material. It derives from the material base so that it can be
+/// two-sided.
 class CTexture : public CMaterialBase
 {
 public:
@@ -17,7 +18,7 @@ protected:
     CTexture(const CTexture& source) = default;
 };
 
-/// Known by name only: no such object is ever made, and a file that holds one ends there.
+/// Known by name only: such objects are never created, and reading a file stops at one.
 class CMultiTex : public CTexture
 {
 public:
@@ -26,7 +27,7 @@ public:
     CMultiTex() = delete;
 };
 
-/// The same.
+/// Same as CMultiTex.
 class CBlendTex : public CTexture
 {
 public:

@@ -6,7 +6,7 @@ namespace gw {
 
 class CImage;
 
-/// An image on a set of texture coordinates.
+/// An image applied to a set of texture coordinates.
 class CTextureMap : public CTexture
 {
 public:
@@ -21,7 +21,7 @@ public:
     void DumpTable(CHTMLTables& tables) override;
     uint64_t GetMemoryUsed() const override;
 
-    int32_t m_iUVWChannel = 0; ///< which of a mesh's maps; whether the mesh has it nobody checks
+    int32_t m_iUVWChannel = 0; ///< index of a mesh's map; not checked against the mesh
     Held<CImage> m_spkImage;
 };
 

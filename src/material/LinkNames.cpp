@@ -1,3 +1,7 @@
+// File names inside containers come from other machines and possibly from an attacker. A relative name is
+// kept within the container's folder, and an absolute one is tried and otherwise reduced to its last part.
+// Names are stored relative if the file is below the folder, so that a scene can be moved with its pictures.
+
 #include "LinkNames.h"
 
 #include "Paths.h"
@@ -35,19 +39,19 @@ std::string_view LastPart(std::string_view name)
     return name.substr(name.find_last_of(kSeparators) + 1); // npos + 1 is 0
 }
 
-// A name of the file in a folder, with this platform's separators. One that leads out of the folder, whatever
-// way it takes, is that of another machine: its last part is what can be looked for here.
+// Joins a folder and a file name, using this platform's separators. A name that leads outside the folder
+// comes from another machine, so only its last part is used.
 std::string Join(const std::string& folder, std::string_view name)
 {
     std::string path(name);
     std::ranges::replace(path, '\\', kPathSeparator);
-    const fs::path normal = fs::path(path).lexically_normal(); // one file, one text
+    const fs::path normal = fs::path(path).lexically_normal(); // one spelling per file
     path = !normal.empty() && *normal.begin() == ".." ? LastPart(name) : normal.string();
     return folder.empty() ? path : folder + kPathSeparator + path;
 }
 
-// A path without . and .. parts if it still is the same file: one file, one text. After a linked folder, ..
-// leads elsewhere.
+// Returns a path without . and .. parts if it is still the same file, so each file has one spelling. After a
+// linked folder, .. leads elsewhere.
 std::string ShortestPath(const std::string& path)
 {
     std::error_code error;
@@ -61,7 +65,7 @@ fs::path Normal(const std::string& path)
     return fs::absolute(path.empty() ? "." : path, error).lexically_normal();
 }
 
-// The path below a folder with / between its parts, or nothing where it does not lie there.
+// Returns the path below a folder with / separators, or nothing if it is not below it.
 std::string BelowFolder(const std::string& folder, const std::string& path)
 {
     const std::string below = Normal(path).lexically_relative(Normal(folder) / "").string();
@@ -84,7 +88,7 @@ std::string StoredLinkName(const std::string& folder, const std::string& path)
     const bool isForeign = IsFromRoot(path) && !path.starts_with('/'); // a path of another system
     std::string below = isForeign ? path : BelowFolder(folder, path);
     const bool isDeep = below.find('/') != below.npos;
-    // What the reader would take apart otherwise is better told from the root.
+    // If the reader would split the name differently, store the full path instead.
     if (below.empty() || below.find('\\') != below.npos || (isDeep && below.find(':') != below.npos))
         return isForeign ? path : Normal(path).string();
     if (!isDeep)
@@ -95,11 +99,11 @@ std::string StoredLinkName(const std::string& folder, const std::string& path)
 
 void NoteFailedLink(const std::string& folder, std::string_view objectName, const std::string& path)
 {
-    // Root may write everywhere, also where nobody is meant to.
+    // Root can write everywhere, even where nobody should.
     if (IsReadOnly(folder.empty() ? "." : folder))
         return;
     const std::string name = Join(folder, "ImageLoadFailed.txt");
-    // A folder may come from anywhere: nothing is written through a link, and no pipe is waited for.
+    // The folder can be anybody's: do not write through a link or wait for a pipe.
     const int file =
         open(name.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC, 0666);
     if (file < 0)

@@ -34,7 +34,7 @@ constexpr FactoryRow kClasses[] = {
 } // namespace
 
 extern "C" {
-// The linker is told to want this name, so that the table is part of every program that links the room.
+// The linker requires this name, so the table is part of every program that links this room.
 extern const int gw_material_classes;
 const int gw_material_classes = RegisterClasses(kClasses);
 }

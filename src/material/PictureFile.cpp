@@ -1,3 +1,7 @@
+// Reads and writes picture files through the codec. The codec's library supports far more formats than
+// pictures need, some of which run commands, so only the formats in the table below are passed to it, and by
+// name.
+
 #include "PictureFile.h"
 
 #include "CMappedFile.h"
@@ -18,12 +22,12 @@ namespace gw {
 
 namespace {
 
-constexpr uint64_t kFrameObjectBytes = 512; // the image object of a frame, which may have one pixel
+constexpr uint64_t kFrameObjectBytes = 512; // the image object of a frame, which can be as small as one pixel
 
 constexpr const char* kCodecModule = "gw_picture_codec.so";
 
-// The formats that pictures may have: names that a file holds must not choose among all that the picture
-// library knows, since some of those run commands.
+// The allowed picture formats. A name in a file must not select from everything the picture library supports,
+// because some formats run commands.
 struct ExtensionRow
 {
     const char* extension;
@@ -49,7 +53,7 @@ constexpr ExtensionRow kExtensions[] = {
     {"pnm",  "PNM" },
 };
 
-// What files of a format begin with, for pictures whose name does not tell what they are.
+// The first bytes of each format, for pictures whose name does not identify it.
 struct BeginningRow
 {
     std::string_view beginning;
@@ -92,7 +96,7 @@ CPictureCodec* OpenCodec()
     return entry ? reinterpret_cast<CPictureCodecEntry>(entry)() : nullptr;
 }
 
-// Counts a picture's pixels before they come; false if the scene's pictures would take too much.
+// Counts a picture's pixels before they are read; false if the scene's pictures would take too much memory.
 bool Reserve(PictureMemory& memory, const PictureHead& head, bool everyFrame)
 {
     const uint64_t pixels = static_cast<uint64_t>(head.width) * static_cast<uint64_t>(head.height);
@@ -121,7 +125,7 @@ bool Decode(std::span<const std::byte> file, const char* format, bool everyFrame
     };
     const bool good = codec && codec->Decode(file, format, everyFrame, place);
     if (!good && memory)
-        memory->m_uiBytesUsed = usedBefore; // the caller frees what came
+        memory->m_uiBytesUsed = usedBefore; // the caller frees the pixels read so far
     return good;
 }
 
@@ -137,7 +141,7 @@ bool DecodeOne(std::span<const std::byte> file, const char* format, PictureMemor
     return good;
 }
 
-// Rows without gaps, which is how the codec wants them: as they are, or packed into `packed`.
+// Returns rows without gaps, as the codec needs them: the original ones, or packed into `packed`.
 const uint8_t* DenseRows(const CPixelBuffer& pixels, const CPixelView& view, std::vector<uint8_t>& packed)
 {
     const auto pixelBytes = static_cast<size_t>(pixels.GetBytesPerPixel());

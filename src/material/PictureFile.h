@@ -15,27 +15,27 @@ namespace gw {
 class CPixelBuffer;
 struct PictureMemory;
 
-/// The codec of this machine, loaded at the first call; null where its module does not lie beside the
-/// program.
+/// Returns the codec, loaded at the first call; null if its module is not next to the program.
 CPictureCodec* LoadPictureCodec();
 
-/// Where a frame goes: its head is told, and the answer is the buffer that takes its pixels.
+/// Receives a frame's properties and returns the buffer for its pixels.
 using CFrameTaker = std::function<CPixelBuffer&(const PictureHead&)>;
 
-/// Reads a picture file into a buffer, 4 bytes a pixel. What it begins with tells the format, else its
-/// extension. False, with the buffer empty, for what is no regular file, no picture, or too large. If the
-/// memory of a scene's pictures is given, the pixels count there, and a picture that exceeds it is not read.
+/// Reads a picture file into a buffer, 4 bytes per pixel. The format is recognized by its first bytes,
+/// otherwise by its extension. Returns false, with an empty buffer, if it is not a regular file or a picture,
+/// or is too large. If the memory of a scene's pictures is given, the pixels count there, and a picture that
+/// exceeds it is not read.
 bool ReadPicture(const std::string& path, CPixelBuffer& pixels, PictureMemory* memory = nullptr);
-/// Reads every frame of a film, or the one of a picture. False when any of it could not be taken.
+/// Reads every frame of a film, or the only one of a picture. Returns false if any frame failed.
 bool ReadFrames(const std::string& path, const CFrameTaker& take, PictureMemory* memory = nullptr);
-/// The picture in the bytes of a JPEG file.
+/// Decodes the bytes of a JPEG file.
 bool DecodeJPEG(std::span<const uint8_t> file, CPixelBuffer& pixels);
 
-/// Makes a picture file's bytes of a picture with 3 or 4 bytes a pixel; false for others. The format is an
-/// extension without its point.
+/// Encodes a picture with 3 or 4 bytes per pixel; false for others. The format is an extension without its
+/// dot.
 bool EncodePicture(const CPixelBuffer& pixels, std::string_view extension, int32_t quality,
                    std::vector<uint8_t>& file);
-/// Writes a picture file of the format that the extension tells, replacing an old one in one step.
+/// Writes a picture file in the format of its extension, replacing an old one atomically.
 bool WritePicture(const std::string& path, const CPixelBuffer& pixels, int32_t quality);
 
 } // namespace gw

@@ -6,17 +6,17 @@
 
 namespace gw {
 
-/// A bounding sphere, in the space of its holder's world.
+/// A bounding sphere in the world space of its owner.
 struct BoundSphere
 {
     Vec3 m_kCentre = kVec3Zero;
     float m_fRadius = 0.0f;
 
-    /// Grows this sphere until it holds the other one too.
+    /// Grows this sphere to include another one.
     void Merge(const BoundSphere& other);
 };
 
-/// The sphere around the middle of the points' axis-aligned box; zero for no points.
+/// Returns the sphere around the center of the points' axis-aligned box; zero without points.
 BoundSphere BoundOfPoints(std::span<const Vec3> points);
 
 } // namespace gw

@@ -10,7 +10,7 @@ const CRTTI CCamera::ms_kRTTI{"CCamera", &CSpatial::ms_kRTTI};
 CCamera::CCamera() = default;
 CCamera::~CCamera() = default;
 
-// A bare copy looks at the same target; cloning replaces it by the target's copy.
+// A plain copy keeps the same look-at target; cloning replaces it by the target's copy.
 CCamera::CCamera(const CCamera& source)
     : CSpatial(source), m_afParameter(source.m_afParameter), m_kEye(source.m_kEye), m_kUp(source.m_kUp),
       m_kWorldEye(source.m_kWorldEye), m_kControlVector(source.m_kControlVector),

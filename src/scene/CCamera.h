@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// A place to look at, for a camera.
+/// The point that a camera looks at.
 class CCameraTarget : public CSpatial
 {
 public:
@@ -18,8 +18,8 @@ public:
     void ApplyRenderStates(RenderStateStack&) override {}
 };
 
-/// A camera: eye, look-at point and up vector in local space. A new one looks from the origin along -Z with Y
-/// up.
+/// A camera: eye, look-at point and up vector in local space. By default it looks from the origin along -Z,
+/// with Y up.
 class CCamera : public CSpatial
 {
 public:
@@ -42,8 +42,8 @@ public:
     std::array<float, 7> m_afParameter{1.0f, 2.0f, 1.0f, 0.0f, 1.0f, 0.0f, 1.0f}; ///< stored and copied only
     Vec3 m_kEye = kVec3Zero;
     Vec3 m_kUp = kVec3UnitY;
-    Vec3 m_kWorldEye = kVec3Zero;      ///< m_kEye in the world, by Update; not stored
-    Vec3 m_kControlVector = kVec3Zero; ///< written by a camera control; not stored
+    Vec3 m_kWorldEye = kVec3Zero;      ///< m_kEye in world space, set by Update; not stored
+    Vec3 m_kControlVector = kVec3Zero; ///< set by a camera control; not stored
     bool m_bCameraFlagA = true;        ///< stored and copied only
     bool m_bCameraFlagB = true;        ///< stored and copied only
     Vec3 m_kLookAt{0.0f, 0.0f, -1.0f};

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// Writes the control vector of its target, a camera.
+/// Animates the control vector of its target, a camera.
 class CCameraControl : public CVectorKeyControl
 {
 public:
@@ -12,7 +12,7 @@ public:
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override { return new CCameraControl(*this); }
-    /// Without keys the vector is (0, 0, 1). Always false.
+    /// Without keys, the vector becomes (0, 0, 1). Always returns false.
     bool Update(float time) override;
 };
 

@@ -12,15 +12,15 @@ namespace {
 // From here on, every float is an integer.
 constexpr float kAllWhole = 8388608.0f;
 
-// The integer next to a frame position if they are at most one unit in the last place apart, otherwise the
-// position. A caller reaches frame f at time f / frequency, and the product with the frequency can miss f by
-// that much; without this, one frame in twenty would be a mixture of two keys.
+// Snaps a frame position to an integer if they differ by at most one unit in the last place. A caller reaches
+// frame f at time f / frequency, and multiplying by the frequency can miss f by that much. Without this, one
+// frame in twenty would be a blend of two keys.
 float WholeFrame(float position)
 {
     if (!(std::fabs(position) < kAllWhole))
         return position;
     const auto nearest = static_cast<float>(static_cast<int32_t>(position + std::copysign(0.5f, position)));
-    // Floats of one sign are in the order of their bits.
+    // Floats with the same sign compare like their bits.
     const int32_t distance = std::bit_cast<int32_t>(position) - std::bit_cast<int32_t>(nearest);
     return distance == 1 || distance == -1 ? nearest : position;
 }

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// How a control's time goes on outside its range. Any value but the named ones acts as Reverse.
+/// How a control's time continues outside its range. Any unnamed value acts as Reverse.
 enum class ECycleType : uint32_t
 {
     Clamp,
@@ -13,8 +13,8 @@ enum class ECycleType : uint32_t
     Reverse,
 };
 
-/// An object that changes another one over time. A caller's time becomes a key time by frequency, phase and
-/// cycle type.
+/// An object that changes another object over time. The caller's time is converted to a key time by
+/// frequency, phase and cycle type.
 class CControl : public CObject
 {
 public:
@@ -27,22 +27,23 @@ public:
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// The controlled object, or null. It is not kept alive; when it dies the pointer becomes null.
+    /// Returns the controlled object, or null. The pointer does not keep it alive and becomes null when it
+    /// dies.
     CObject* GetTarget() const { return m_pkTarget.Get(); }
     virtual void SetTarget(CObject* target) { m_pkTarget.Set(target); }
-    /// Rewrites the target's transform; true when it was rewritten.
+    /// Updates the target's transform. Returns true if it was written.
     virtual bool UpdateTransform(float time) = 0;
     bool Update(float time) override = 0;
-    /// Ignores the range and updates.
+    /// Updates without regard to the range.
     bool UpdateRange(uint32_t range, float time) override;
 
     CControl* GetNext() const { return m_spkNext.Get(); }
     void SetNext(CControl* next) { m_spkNext = next; }
-    /// The end of the chain that begins here.
+    /// Returns the last control of the chain that starts here.
     CControl* GetLast();
 
-    /// The key time of a caller's time: time x frequency + phase, brought into the range by the cycle type. A
-    /// result that is no number is the begin time.
+    /// Converts a caller's time to a key time: time x frequency + phase, mapped into the range by the cycle
+    /// type. A NaN becomes the begin time.
     float MapTime(float time) const;
 
     uint32_t m_iCycleType = 0; ///< ECycleType, as stored
@@ -62,8 +63,7 @@ private:
     Held<CControl> m_spkNext;
 };
 
-/// The class that links of a modifier chain must have. No concrete class derives from it, so no such object
-/// exists.
+/// The class that links of a modifier chain must have. It has no concrete classes, so no such object exists.
 class CModifier : public CControl
 {
 public:

@@ -52,10 +52,10 @@ void CRawData::Fields(CFieldArchive& archive)
     {
         std::vector<std::byte> bytes;
         archive.OptionalBlock("m_pbyData", bytes, m_uiDataSize);
-        SetData(std::move(bytes)); // a size without a block is 0
+        SetData(std::move(bytes)); // a size without a block becomes 0
         return;
     }
-    // Archives that do not read change nothing.
+    // Only archives that read modify the bytes.
     std::span<std::byte> bytes(const_cast<std::byte*>(m_pbyData.get()), m_uiDataSize);
     if (archive.Presence("m_pbyData", !bytes.empty()))
         archive.Row("m_pbyData", bytes);

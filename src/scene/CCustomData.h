@@ -11,8 +11,7 @@ namespace gw {
 
 class CMappedFile;
 
-/// A tagged object that a container carries without knowing what it means; a chain of them hangs on any
-/// object.
+/// A tagged object that a container stores without interpreting it. Any object can have a chain of them.
 class CCustomData : public CObject
 {
 public:
@@ -23,15 +22,15 @@ public:
     ~CCustomData() override;
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     void Fields(CFieldArchive& archive) override;
-    /// Custom data has no tables, and nothing leads to a page of it.
+    /// Writes nothing: custom data has no tables, and no page links to it.
     void DumpTable(CHTMLTables&) override {}
     uint64_t GetMemoryUsed() const override;
 
-    /// Stores a copy of a free text, or null, and the version as major x 100 + minor.
+    /// Stores a copy of a free text (may be null) and a version as major x 100 + minor.
     void SetCreator(const char* creator, uint32_t major, uint32_t minor);
     const char* GetCreator() const { return m_pcCreator.Get(); }
     uint32_t GetCreatorVersion() const { return m_uiCreatorVersion; }
-    /// A word that is free for the creator.
+    /// Returns a word for the creator's own use.
     void SetUserWord(uint32_t word) { m_uiUserWord = word; }
     uint32_t GetUserWord() const { return m_uiUserWord; }
     CCustomData* GetNextData() const { return m_spkNextData.Get(); }
@@ -44,7 +43,7 @@ private:
     Held<CCustomData> m_spkNextData;
 };
 
-/// A block of bytes as custom data.
+/// Custom data that is a block of bytes.
 class CRawData : public CCustomData
 {
 public:
@@ -58,26 +57,26 @@ public:
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Stores a copy of the bytes; no bytes leave no block.
+    /// Stores a copy of the bytes; without bytes, the block is removed.
     void SetData(std::span<const std::byte> bytes) { SetData(std::vector(bytes.begin(), bytes.end())); }
     void SetData(std::vector<std::byte>&& bytes);
     /// Refers to the bytes of a file of at most 4 GiB without copying them.
     void SetData(CMappedFile&& file);
     std::span<const std::byte> Data() const { return {m_pbyData.get(), m_uiDataSize}; }
-    /// Whether a file that the bytes are in still has them all; see CMappedFile.
+    /// Returns whether the file that contains the bytes is still complete; see CMappedFile.
     bool IsWhole() const;
-    /// Passes the bytes on in pieces. Memory that a piece of a mapped file took is freed after it. False as
-    /// soon as the sink returns false, and if the file was not whole.
+    /// Sends the bytes to a sink in pieces, releasing the memory of a mapped file piece by piece. Returns
+    /// false as soon as the sink does, and if the file was not complete.
     bool WriteData(const CByteSink& sink) const;
 
 private:
     uint32_t m_uiDataSize = 0;
-    std::shared_ptr<const std::byte> m_pbyData; // never changes once set, so copies of the object share it
-    std::shared_ptr<CMappedFile> m_spkFile;     // which the block is in; null for a block in memory
+    std::shared_ptr<const std::byte> m_pbyData; // shared by copies of the object; never modified once set
+    std::shared_ptr<CMappedFile> m_spkFile;     // contains the block; null for a block in memory
 };
 
-/// Five texts about a file's author. Its class record names CObject as base although it is a CCustomData in
-/// all else.
+/// Five texts about a file's author. Its class record names CObject as base, although it is a CCustomData in
+/// every other respect.
 class CAuthorInfo : public CCustomData
 {
 public:

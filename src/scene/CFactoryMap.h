@@ -11,22 +11,22 @@ namespace gw {
 
 class COrrinStream;
 
-/// Makes an object and lets it read itself from the stream; null for a class that cannot be made.
+/// Creates an object and reads it from the stream; returns null for a class that cannot be created.
 using CObjectFactory = CObject* (*)(COrrinStream& stream);
 
-/// From class name to factory: by it a container's class names become objects. One for the whole program,
-/// filled before main by the class tables of the rooms (SceneClasses.cpp and its kin).
+/// Maps class names in containers to factories. One for the whole program, filled before main by the class
+/// tables of the rooms (SceneClasses.cpp and similar files).
 class CFactoryMap
 {
 public:
     static CFactoryMap& Instance();
 
-    /// An entry set twice keeps the last value.
+    /// Registers a factory; the last one for a name wins.
     void Set(std::string_view className, CObjectFactory factory)
     {
         m_kFactory[std::string(className)] = factory;
     }
-    /// The factory of a class, or null for a name that is not registered.
+    /// Returns the factory of a class, or null for an unregistered name.
     CObjectFactory Find(std::string_view className) const;
     const std::map<std::string, CObjectFactory, std::less<>>& Entries() const { return m_kFactory; }
 
@@ -41,10 +41,10 @@ struct FactoryRow
     CObjectFactory m_pkFactory;
 };
 
-/// Enters a table in the map. The answer is the number of rows, for the static that calls this.
+/// Registers all rows of a table. Returns the row count, to initialize the static that calls this.
 int RegisterClasses(std::span<const FactoryRow> rows);
 
-/// The factory of every abstract class.
+/// The factory of abstract classes; returns null.
 CObject* MakeNothing(COrrinStream& stream);
 
 } // namespace gw

@@ -10,7 +10,7 @@ size_t CFieldArchive::Fitting(int64_t count, size_t)
     return static_cast<size_t>(std::max<int64_t>(count, 0));
 }
 
-// For those who have nothing better to do with it than with any other values.
+// The default, for archives without a shortcut for repeated values.
 void CFieldArchive::Repeated(const char* name, EFieldKind kind, const void* value, size_t count)
 {
     const size_t size = FieldBytes(kind);

@@ -18,7 +18,7 @@
 
 namespace gw {
 
-/// What a stored value is. The names say how a value is shown; the sizes are those of the file.
+/// The type of a stored value. Names say how it is displayed; the sizes are those in the file.
 enum class EFieldKind : uint8_t
 {
     Bool,       ///< 1 byte, 0 or 1
@@ -32,21 +32,21 @@ enum class EFieldKind : uint8_t
     Matrix,     ///< 64 bytes
 };
 
-/// Bytes of one value of a kind in a file, which is also its size in memory.
+/// Returns the size in bytes of one value of a kind, in the file and in memory.
 constexpr size_t FieldBytes(EFieldKind kind)
 {
     constexpr size_t kBytes[] = {1, 1, 2, 4, 4, 4, 12, 16, 64};
     return kBytes[static_cast<size_t>(kind)];
 }
 
-/// What a list is made of.
+/// The element type of a list.
 enum class EListKind : uint8_t
 {
     Links,
-    Records, ///< elements with fields of their own
+    Records, ///< elements with their own fields
 };
 
-/// The kind of a plain C++ type.
+/// The kind of a C++ type.
 template <class T>
 constexpr EFieldKind FieldKind()
 {
@@ -71,8 +71,8 @@ constexpr EFieldKind FieldKind()
     }
 }
 
-/// One reference of an object to another, whatever its class: what an archive reads, writes, resolves or
-/// follows.
+/// A reference from one object to another, independent of its class, for archives to read, write, resolve or
+/// follow.
 class CLinkSlot
 {
 public:
@@ -90,9 +90,9 @@ public:
     }
 
     CObject* Get() const { return m_pkGet(m_pkSlot); }
-    /// An object of another class than the slot's becomes null.
+    /// Sets the reference. An object of a class other than the slot's sets it to null.
     void Set(CObject* object) const { m_pkSet(m_pkSlot, object); }
-    /// Whether the slot keeps its object alive. Only such links are registered and followed.
+    /// Returns whether the slot keeps its object alive. Only such links are registered and followed.
     bool IsCounted() const { return m_bCounted; }
 
 private:
@@ -107,17 +107,16 @@ private:
     bool m_bCounted;
 };
 
-/// What runs a class's list of stored fields. Each scene class names its fields once, base first, in file
-/// order, in CObject::Fields; the archives below this one read, write, count, resolve, follow and describe
-/// them.
+/// Visits a class's list of stored fields. Each scene class lists its fields once, base class first, in file
+/// order, in CObject::Fields. Derived archives read, write, count, resolve, follow and describe them.
 class CFieldArchive
 {
 public:
     virtual ~CFieldArchive() = default;
 
-    /// True only while the fields are filled from a file: then values, sizes and counts change.
+    /// Returns whether fields are being filled from a file. Only then can values, sizes and counts change.
     bool IsReading() const { return m_bReading; }
-    /// Whether the file has at least a version; always true where no old file is read.
+    /// Returns whether the file has at least this version; always true unless an old file is being read.
     bool AtLeast(CVersion version) const { return m_kVersion.AtLeast(version); }
 
     void Bool(const char* name, bool& value) { Plain(name, EFieldKind::Bool, &value, 1); }
@@ -128,14 +127,14 @@ public:
     void Float(const char* name, float& value) { Plain(name, EFieldKind::Float, &value, 1); }
     void Vector(const char* name, Vec3& value) { Plain(name, EFieldKind::Vector, &value, 1); }
     void Matrix(const char* name, Mat4& value) { Plain(name, EFieldKind::Matrix, &value, 1); }
-    /// Values in a row with no count of their own.
+    /// An array of values without a stored count.
     template <class R>
     void Row(const char* name, R& values)
     {
         Plain(name, FieldKind<typename R::value_type>(), values.data(), values.size());
     }
 
-    /// A length and its characters.
+    /// A length followed by the characters.
     virtual void Text(const char* name, CText& text) = 0;
 
     template <class T>
@@ -148,14 +147,14 @@ public:
     {
         Slot(name, CLinkSlot::Plain(slot));
     }
-    /// A count and a link for each element. Slot is Held<T> or Watch<T>.
+    /// A count followed by one link per element. Slot is Held<T> or Watch<T>.
     template <class Slots>
     void Links(const char* name, Slots& slots)
     {
         slots.resize(Count(name, slots.size(), 4));
         LinkRow(name, slots);
     }
-    /// Links in a row with no count of their own.
+    /// An array of links without a stored count.
     template <class Slots>
     void LinkRow(const char* name, Slots& slots)
     {
@@ -170,7 +169,7 @@ public:
         EndArray();
     }
 
-    /// A count and that many plain values in one copy.
+    /// A count followed by that many plain values, copied as one block.
     template <class T>
     void Block(const char* name, std::vector<T>& values)
     {
@@ -180,7 +179,7 @@ public:
     }
     template <class T>
     void Block(const char* name, CKeyArray<T>& keys);
-    /// The same with a signed count, of which those below 0 are none.
+    /// Same with a signed count; a negative count means no elements.
     template <class T>
     void SignedBlock(const char* name, std::vector<T>& values)
     {
@@ -192,8 +191,9 @@ public:
         Elements(name, values,
                  IsReading() ? Fitting(stored, sizeof(T)) : Count(name, values.size(), sizeof(T)));
     }
-    /// A presence word and, where it is not 0, `count` plain values. On reading, a zero word leaves the block
-    /// empty whatever the count, and a count below 0 with a block is damage: its length cannot be told.
+    /// A presence word, followed by `count` plain values if it is not 0. When reading, a zero word leaves the
+    /// block empty whatever the count is. A negative count with a block is damage, because the block's length
+    /// is unknown.
     template <class T>
     void OptionalBlock(const char* name, std::vector<T>& values, int64_t count)
     {
@@ -208,29 +208,30 @@ public:
             values.clear();
     }
 
-    /// A count and a list of elements that have fields of their own: fields(archive, element).
+    /// A count followed by elements with their own fields: fields(archive, element).
     template <class T, class F>
     void Array(const char* name, std::vector<T>& elements, F fields);
 
-    /// A presence word of the file: any value but 0 means present. Answers what holds from here on.
+    /// A presence word; any value but 0 means present. Returns the value from the file when reading,
+    /// otherwise `present`.
     virtual bool Presence(const char* name, bool present) = 0;
-    /// A 32-bit count of elements of at least `leastBytes` each. Reading answers the file's, or 0 and a
-    /// failure where the bytes that remain cannot hold them; every other archive answers `count`.
+    /// A 32-bit count of elements of at least `leastBytes` each. When reading, returns the count in the file,
+    /// or 0 and a failure if the remaining bytes cannot hold that many. Other archives return `count`.
     virtual size_t Count(const char* name, size_t count, size_t leastBytes) = 0;
-    /// How many of `count` elements of a size the file can still hold: all, or none and a failure. Below 0 is
-    /// none.
+    /// Returns `count` if the rest of the file can hold that many elements of this size, otherwise 0 and a
+    /// failure. Negative counts are 0.
     virtual size_t Fitting(int64_t count, size_t elementBytes);
-    /// Ends a read here, as damaged or for want of room; fields that follow read as zeros. A write fails.
+    /// Fails the operation because of damage or lack of space. When reading, all later fields read as zero.
     virtual void Refuse(EFailure) {}
 
 protected:
     CFieldArchive(bool reading, CVersion version) : m_kVersion(version), m_bReading(reading) {}
-    /// For an archive that only looks at links. It is not shown plain values, which every search of a tree
-    /// would have to skip by one virtual call each.
+    /// For archives that only look at links. They are not shown plain values, because skipping each one would
+    /// cost a virtual call in every search of a tree.
     explicit CFieldArchive(CVersion version) : m_kVersion(version), m_bReading(false), m_bLinksOnly(true) {}
 
     virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
-    /// The same value, so many times.
+    /// The same value repeated `count` times.
     virtual void Repeated(const char* name, EFieldKind kind, const void* value, size_t count);
     virtual void Slot(const char* name, const CLinkSlot& slot) = 0;
     virtual void BeginArray(const char*, EListKind) {}
@@ -252,7 +253,7 @@ private:
     bool m_bLinksOnly = false;
 };
 
-/// Adds up the bytes that fields take in a file.
+/// Counts the bytes that fields take in a file.
 class CFieldCounter : public CFieldArchive
 {
 public:
@@ -272,8 +273,8 @@ private:
     uint64_t m_uiBytes = 0;
 };
 
-// A vector zeroes what it gains. Piece by piece the zeros are still in the cache when they are overwritten,
-// so that a large block costs what a plain copy does.
+// A vector zeroes the elements it gains. In small pieces, the zeros are still in the cache when they are
+// overwritten, so a large block is as fast as a plain copy.
 template <class T>
 void CFieldArchive::Elements(const char* name, std::vector<T>& values, size_t count)
 {
@@ -322,7 +323,7 @@ void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
     EndArray();
 }
 
-/// Shows every link to a function, in file order, and passes over everything else.
+/// Passes every link to a function, in file order, and skips everything else.
 template <class F>
 class CLinkVisitor : public CFieldArchive
 {

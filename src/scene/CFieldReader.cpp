@@ -1,3 +1,6 @@
+// Reads fields from a byte range. The first value that does not fit marks the reader as damaged; every later
+// field reads as zero without touching the bytes, so callers check for damage only once per object.
+
 #include "CFieldReader.h"
 
 #include "CMappedFile.h"
@@ -8,7 +11,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kForgetBytes = size_t{16} << 20; // seldom enough to cost nothing
+constexpr size_t kForgetBytes = size_t{16} << 20; // rare enough to cost nothing
 
 } // namespace
 

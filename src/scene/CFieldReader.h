@@ -11,8 +11,8 @@ namespace gw {
 
 class CMappedFile;
 
-/// Fills fields from the bytes of a container, and trusts none of them: what does not fit into the bytes that
-/// remain is damage, and from there on every field reads as zero.
+/// Fills fields from the bytes of a container without trusting them: a value that does not fit into the
+/// remaining bytes is damage, and from there on every field reads as zero.
 class CFieldReader : public CFieldArchive
 {
 public:
@@ -28,17 +28,17 @@ public:
     size_t Fitting(int64_t count, size_t elementBytes) override;
     void Refuse(EFailure reason) override { Fail(reason); }
 
-    /// A length and its characters, as a view into the bytes.
+    /// Reads a length and the characters. Returns a view into the bytes.
     std::string_view ReadString();
     uint32_t ReadUnsigned();
 
     size_t Position() const { return m_uiPosition; }
     bool AtEnd() const { return m_uiPosition >= m_kBytes.size(); }
     bool IsDamaged() const { return static_cast<bool>(record_.Failure()); }
-    /// The file that the bytes are mapped from. Its pages are given back as they are used up, so that a large
-    /// block does not stand in memory twice.
+    /// Sets the file that the bytes are mapped from. Its pages are released once they are read, so a large
+    /// block is not in memory twice.
     void SetSource(CMappedFile* file) { m_pkFile = file; }
-    /// Where link ids go, and the class whose fields are read, for the failure record.
+    /// Starts an object: sets where its link ids go, and its class name for the failure record.
     void BeginObject(std::vector<uint32_t>& linkIDs, const char* className);
 
 protected:

@@ -1,3 +1,6 @@
+// Turns fields into table rows. Each kind of value has one formatting function in kTextOf. An array is one row:
+// everything in it, nested arrays included, is appended to the row's cell.
+
 #include "CFieldRows.h"
 
 #include "HTMLMarkup.h"
@@ -10,7 +13,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kShownValues = 64; // more tell nobody anything, and large meshes would not open
+constexpr size_t kShownValues = 64; // more would not help a reader, and pages of large meshes would not open
 
 template <class T>
 std::string IntegerAt(const std::byte* value)
@@ -28,7 +31,7 @@ std::string TextAt(const std::byte* value)
     return HTMLText(number);
 }
 
-// By EFieldKind.
+// Indexed by EFieldKind.
 constexpr std::string (*kTextOf[])(const std::byte* value) = {
     TextAt<bool>,        // Bool
     IntegerAt<uint8_t>,  // Byte

@@ -8,16 +8,15 @@
 
 namespace gw {
 
-/// One stored field as a row of a table.
+/// One stored field as a table row.
 struct FieldRow
 {
     std::string name;
     std::string cell;             ///< markup
-    std::vector<CObject*> linked; ///< what the cell has anchors to
+    std::vector<CObject*> linked; ///< the objects that the cell links to
 };
 
-/// Makes a row of every field. Of long blocks and lists the beginning is shown and their length told; every
-/// link is shown.
+/// Makes one row per field. Long blocks and lists are shortened and show their length; every link is shown.
 class CFieldRows : public CFieldArchive
 {
 public:
@@ -40,9 +39,9 @@ private:
     void Show(const char* name, const std::string& text);
 
     std::vector<FieldRow> m_kRows;
-    size_t m_uiArrays = 0;  // around the present place
+    size_t m_uiArrays = 0;  // nesting depth of arrays at the current field
     size_t m_uiRecords = 0; // so far, in the outermost array
-    size_t m_uiCount = 0;   // the last one
+    size_t m_uiCount = 0;   // the last count
 };
 
 } // namespace gw

@@ -9,24 +9,23 @@
 
 namespace gw {
 
-/// Writes fields as a container holds them. Small values are gathered, large blocks go to the sink as they
-/// are.
+/// Writes fields in the container format. Small values are buffered; large blocks go directly to the sink.
 class CFieldWriter : public CFieldArchive
 {
 public:
-    /// `linkID` gives the id that an object has in this file.
+    /// `linkID` returns an object's id in this file.
     CFieldWriter(CByteSink sink, std::function<uint32_t(const CObject*)> linkID);
 
     void Text(const char* name, CText& text) override;
     bool Presence(const char* name, bool present) override;
     size_t Count(const char* name, size_t count, size_t leastBytes) override;
-    /// What is written cannot be had: the file is not to stand.
+    /// The content is not available, so the file must not be kept.
     void Refuse(EFailure) override { m_bRefused = true; }
 
     void WriteString(std::string_view text);
     void WriteUnsigned(uint32_t value);
     void WriteBytes(std::span<const std::byte> bytes);
-    /// Hands the gathered bytes on. False when the sink or a class has refused anything since the start.
+    /// Flushes the buffered bytes. Returns false if the sink or a class has failed since the start.
     bool Flush();
 
 protected:

@@ -1,3 +1,8 @@
+// Why the walk needs no recursion and still ends: each object is entered once and its held objects are pushed
+// on an explicit stack. An object that is met again while it is still on the path closes a cycle; one that is
+// already finished brings its known depth and visit count along. Every link is therefore followed once,
+// however many paths lead to it.
+
 #include "CGraphCheck.h"
 
 #include <algorithm>
@@ -45,7 +50,7 @@ EFailure CGraphCheck::Walk(CObject& start)
     return EFailure::None;
 }
 
-// Everything below is finished; without rings that is so for what was met before as well.
+// All objects below are finished. Without cycles, this also holds for those met earlier.
 bool CGraphCheck::Finish(const Step& step)
 {
     Entry& entry = m_kEntries[step.object];

@@ -9,17 +9,18 @@
 
 namespace gw {
 
-/// Places that a walk from the roots may visit, shared objects once per place: so many for each object, and
-/// so many in all, which an update takes seconds for.
+/// Limits for the visits of a recursive walk from the roots, which meets a shared object once per path: per
+/// object, and in total, where one update takes seconds.
 inline constexpr double kVisitsPerObject = 1e6;
 inline constexpr double kVisitsLimit = 5e7;
 
-/// Walks a graph by its counted references, without recursion, and tells what recursion would meet: rings,
-/// the deepest nesting, and the number of places to visit.
+/// Walks a graph along its counted references, without recursion, and finds what a recursive walk would run
+/// into: cycles, the nesting depth, and the number of visits.
 class CGraphCheck
 {
 public:
-    /// None, Cycle, TooDeep or TooLarge. The objects are all those that the roots reach, and may be more.
+    /// Returns None, Cycle, TooDeep or TooLarge. `objects` must include every object that the roots reach,
+    /// and may include others.
     EFailure Check(std::span<CObject* const> objects, std::span<const Ref<CObject>> roots);
 
 private:

@@ -1,3 +1,6 @@
+// The pages of a dump link to each other, and any object can link to any other. So pages are not written
+// recursively: an object that a page links to joins a queue, once, and the dump ends when the queue is empty.
+
 #include "CHTMLDump.h"
 
 #include "CHTMLTables.h"
@@ -11,7 +14,7 @@ namespace gw {
 
 namespace {
 
-// What the script calls a node.
+// Returns the name of a node in the script.
 std::string ScriptName(const CObject& object)
 {
     return "Node" + HTMLUnsigned(object.GetID());
@@ -41,7 +44,7 @@ COrnHTMLWriter IndexPage(const CObject& root, const std::string& treeName)
     return page;
 }
 
-// Every page of an object names its code page, because it may be opened by itself.
+// Every object page names its code page, because it can be opened on its own.
 COrnHTMLWriter ObjectPage()
 {
     COrnHTMLWriter page;
@@ -53,7 +56,8 @@ COrnHTMLWriter ObjectPage()
 
 CHTMLDump* CHTMLDump::ms_pkRunning = nullptr;
 
-// Level by level. What is listed but not expanded keeps the tree no larger than the graph has links.
+// Breadth-first. Repeated nodes are listed but not expanded, so the tree is no larger than the graph's number
+// of links.
 std::vector<CHTMLDump::TreeEntry> CHTMLDump::TreeOf(CObject& root)
 {
     std::unordered_set<const CObject*> inTree{&root};
@@ -77,7 +81,7 @@ std::vector<CHTMLDump::TreeEntry> CHTMLDump::TreeOf(CObject& root)
     return entries;
 }
 
-// Only the first entry of a node gets a name in the script: its children go there.
+// Only the first entry of a node has a name in the script, because its children are added there.
 std::string CHTMLDump::TreeScript(const std::vector<TreeEntry>& entries)
 {
     std::string script = "\n";

@@ -11,22 +11,22 @@
 
 namespace gw {
 
-/// Puts the tables of one object on a page, class by class, and collects the objects that their anchors lead
-/// to. A class says in CObject::DumpTable what its table has.
+/// Writes the tables of one object to a page, class by class, and collects the objects that they link to.
+/// Each class adds its table in CObject::DumpTable.
 class CHTMLTables
 {
 public:
     explicit CHTMLTables(COrnHTMLPage& page) : page_(page) {}
 
-    /// The heading of a class and its table, closed by the next one or by End.
+    /// Starts a class: its heading and its table, which the next Begin or End closes.
     void Begin(const CRTTI& record);
     void End();
-    /// Label and cell are markup.
+    /// Adds a row. Label and cell are markup.
     void Row(std::string_view label, std::string_view cell);
-    /// Gives an object a page, for one that a row has an anchor to.
+    /// Requests a page for an object that a row links to.
     void Follow(CObject& object) { m_kLinked.push_back(&object); }
 
-    /// A table of all that a class adds to the stored fields of its base.
+    /// Adds a table of the fields that a class adds to its base.
     template <class Class, class Base>
     void OwnFields(Class& object)
     {
@@ -38,7 +38,7 @@ public:
         AddRows(rows.Rows().subspan(inherited.Rows().size()));
     }
 
-    /// Who is to have a page, in the order of the anchors; an object may stand there twice.
+    /// Returns the objects that need a page, in link order, possibly with duplicates.
     const std::vector<CObject*>& Linked() const { return m_kLinked; }
 
 private:

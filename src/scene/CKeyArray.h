@@ -11,8 +11,9 @@
 
 namespace gw {
 
-/// The keys of a track. As long as all of them are equal, bit for bit, only one is stored: most bones never
-/// change their length, and nearly none its scale. Indexes beyond the end give the last key; there must be
+/// The keys of a track. While all keys are equal, bit for bit, only one is stored: most bones never change
+/// their length, and almost none its scale. An index past the end returns the last key; the array must not be
+/// empty.
 /// one.
 template <class T>
 class CKeyArray
@@ -22,7 +23,7 @@ class CKeyArray
 public:
     CKeyArray() = default;
     CKeyArray(std::initializer_list<T> keys) : CKeyArray(std::vector<T>(keys)) {}
-    /// Keeps one key if all are equal.
+    /// Stores one key if all are equal.
     CKeyArray(std::vector<T> keys) : m_uiSize(keys.size())
     {
         const auto differs = [&](const T& key) { return !IsSame(key, keys.front()); };
@@ -37,10 +38,10 @@ public:
     const T& operator[](size_t index) const { return m_kStored[std::min(index, m_kStored.size() - 1)]; }
     const T& front() const { return m_kStored.front(); }
     const T& back() const { return m_kStored.back(); }
-    /// What is stored: one key if all are equal, otherwise all.
+    /// Returns the stored keys: one if all are equal, otherwise all.
     std::span<const T> Distinct() const { return m_kStored; }
 
-    /// As many keys as will come. Takes no memory until they differ.
+    /// Announces the number of keys. Allocates nothing until keys differ.
     void reserve(size_t count) { m_uiExpected = count; }
     void assign(size_t count, const T& key)
     {
@@ -55,13 +56,13 @@ public:
             Expand().push_back(key);
         ++m_uiSize;
     }
-    /// Replaces the key at an index below size().
+    /// Replaces the key at an index, which must be below size().
     void Set(size_t index, const T& key)
     {
         if (m_kStored.size() != 1 || !IsSame(key, m_kStored.front()))
             Expand()[index] = key;
     }
-    /// All keys, each with its own place, to be changed there. Their number must stay.
+    /// Returns all keys, stored separately, for editing. Do not change their number.
     std::vector<T>& Expand()
     {
         if (m_kStored.size() < m_uiSize)
@@ -85,7 +86,7 @@ public:
 private:
     static bool IsSame(const T& a, const T& b) { return std::memcmp(&a, &b, sizeof(T)) == 0; }
 
-    std::vector<T> m_kStored; // no key, one for all, or all
+    std::vector<T> m_kStored; // empty, one key for all, or all keys
     size_t m_uiSize = 0;
     size_t m_uiExpected = 0;
 };

@@ -1,3 +1,6 @@
+// Maps a time to a key time in three steps: find the scheduled clip that plays at this time, compute how far
+// into the clip it is, and wrap or hold that position by the clip's type.
+
 #include "CKeyframeClipControl.h"
 
 #include "CFieldArchive.h"
@@ -13,7 +16,7 @@ namespace {
 
 constexpr int32_t kHeldClip = 0;
 constexpr int32_t kIdleClip = 2;
-// One frame of slack, so that a clip begins on the frame where its start falls.
+// One frame of tolerance, so that a clip begins on the frame that its start falls in.
 constexpr float kSlack = 0.016666668f;
 
 float ClipLocal(float u, const ClipRecord& clip)
@@ -21,7 +24,7 @@ float ClipLocal(float u, const ClipRecord& clip)
     const float length = clip.m_fEnd - clip.m_fBegin;
     if (clip.m_iType == kHeldClip || !(length > 0.0f) || !std::isfinite(u))
         return clip.m_fBegin;
-    // What is left of whole lengths taken off, without a loop that a tiny length could keep busy for ever.
+    // Wraps by remainder: a loop that subtracts a tiny length could run forever.
     const float local = u >= length ? std::fmod(u, length) : u;
     return local + clip.m_fBegin;
 }

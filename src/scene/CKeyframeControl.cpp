@@ -1,3 +1,8 @@
+// Keyframe interpolation. The tracks are sampled separately: linear for positions and scales, spherical for
+// rotations. Each track remembers where the last search ended, because playback asks for ascending times. The
+// target's local matrix becomes S · R of the samples; the parent's pose is undone if the mask asks for it, and
+// the position is added last.
+
 #include "CKeyframeControl.h"
 
 #include "CFieldArchive.h"
@@ -101,8 +106,8 @@ bool CKeyframeControl::UpdateTransform(float time)
     return true;
 }
 
-// Undoes the selected components of the pose that the parent's first track has at this time by its keys
-// alone.
+// Undoes the selected components of the pose that the parent's first track has at this time, computed from
+// its keys alone.
 void CKeyframeControl::CancelParent(CSpatial& target, float time)
 {
     CSpatial* parent = target.GetParent();

@@ -13,10 +13,9 @@ namespace gw {
 
 class CSpatial;
 
-/// Rotation, position and scale tracks that rewrite the local matrix of their target, a spatial. Either
-/// m_kKeyTimes is filled and all three run on it, index for index, or each has its own time axis. Times are
-/// ascending; keeping them so and as long as the keys is the caller's duty, and where files did not, the last
-/// key there is stands in.
+/// Rotation, position and scale tracks that set the local matrix of their target, a spatial. Either all three
+/// share m_kKeyTimes, index for index, or each has its own times. The caller must keep times ascending and as
+/// many as there are keys; if a file has fewer keys, the last one is repeated.
 class CKeyframeControl : public CControl
 {
 public:
@@ -30,11 +29,11 @@ public:
     void Fields(CFieldArchive& archive) override;
     uint64_t GetMemoryUsed() const override;
 
-    /// Never animates by itself: false.
+    /// Always returns false: it does not animate by itself.
     bool Update(float time) override;
     bool UpdateTransform(float time) override;
 
-    /// The pose at a caller's time. Empty tracks give the identity, the origin and (1, 1, 1).
+    /// Computes the pose at a caller's time. Empty tracks yield the identity, the origin and (1, 1, 1).
     void GetPose(float time, Mat3& rotation, Vec3& position, Vec3& scale);
 
     bool m_bHasRestMatrix = false;      ///< m_kRestMatrix is valid
@@ -42,12 +41,12 @@ public:
     std::vector<Quat> m_kRotationKeys;
     CKeyArray<Vec3> m_kPositionKeys;
     CKeyArray<Vec3> m_kScaleKeys;
-    std::vector<float> m_kKeyTimes; ///< the axis that the three tracks share
+    std::vector<float> m_kKeyTimes; ///< times shared by the three tracks
     std::vector<float> m_kRotationTimes;
     std::vector<float> m_kPositionTimes;
     std::vector<float> m_kScaleTimes;
-    /// Which parts of the parent's key pose are undone here: bits 0 to 2 position x, y, z; 3 to 5 rotation; 6
-    /// to 8 scale.
+    /// The components of the parent's key pose that are undone here: bits 0 to 2 position x, y, z; 3 to 5
+    /// rotation; 6 to 8 scale.
     uint32_t m_uiParentMask = 0;
 
 private:

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// A light of some kind: colour and intensity.
+/// Base of all lights: color and intensity.
 class CLight : public CSpatial
 {
 public:
@@ -23,7 +23,7 @@ public:
     bool m_bLightOn = true; ///< stored and copied only
 };
 
-/// A light that shines from a point.
+/// A point light.
 class CPointLight : public CLight
 {
 public:
@@ -38,7 +38,7 @@ public:
     uint32_t GetLightType() const override { return 2; }
 
     Vec3 m_kLocation = kVec3Zero;
-    Vec3 m_kWorldLocation = kVec3Zero; ///< in the world, by Update; not stored
+    Vec3 m_kWorldLocation = kVec3Zero; ///< in world space, set by Update; not stored
     uint32_t m_uiLightWord = 0;        ///< copied, not stored
 };
 

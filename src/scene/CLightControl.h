@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// Writes the colour of its target, a light.
+/// Animates the color of its target, a light.
 class CLightControl : public CVectorKeyControl
 {
 public:
@@ -12,7 +12,7 @@ public:
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
     CObject* CreateClone() const override { return new CLightControl(*this); }
-    /// Without keys the colour stays. Always false.
+    /// Without keys, the color is unchanged. Always returns false.
     bool Update(float time) override;
 };
 

@@ -1,3 +1,6 @@
+// The scene tree. Child slots can be null, also in files, and keep their index when a child is removed:
+// references by slot stay valid, and every walk skips empty slots.
+
 #include "CNode.h"
 
 #include "CFieldArchive.h"
@@ -14,13 +17,13 @@ const CRTTI CBillboardNode::ms_kRTTI{"CBillboardNode", &CNode::ms_kRTTI};
 
 namespace {
 
-constexpr uint32_t kMostSpareSlots = 4096; // a file's word must not take memory at will
+constexpr uint32_t kMostSpareSlots = 4096; // a file must not be able to reserve arbitrary memory
 
 } // namespace
 
 CNode::CNode(uint32_t growBy) : m_uiGrowBy(growBy) {}
 
-// The child array stays empty: cloning attaches the copies.
+// The child array stays empty; cloning attaches the copied children.
 CNode::CNode(const CNode& source)
     : CSpatial(source), m_uiGrowBy(source.m_uiGrowBy), m_bNodeFlagA(source.m_bNodeFlagA),
       m_bNodeFlagB(source.m_bNodeFlagB)

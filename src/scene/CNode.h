@@ -10,7 +10,7 @@ class CNode : public CSpatial
 public:
     static const CRTTI ms_kRTTI;
 
-    /// The argument is the number of spare slots when SetChildAt enlarges the child array.
+    /// `growBy` is the number of spare slots that SetChildAt adds when it enlarges the child array.
     explicit CNode(uint32_t growBy = 1);
     CNode(const CNode& source);
     ~CNode() override;
@@ -28,26 +28,26 @@ public:
     void UpdateBound() override;
     void ApplyRenderStates(RenderStateStack& stack) override;
 
-    /// A copy of the tree's nodes alone: no meshes, no controls, child slots packed. The map keeps what is
-    /// shared shared.
+    /// Copies only the nodes of the tree: no meshes or controls, and child slots packed. The map keeps shared
+    /// nodes shared.
     virtual CNode* CopySkeleton(CCloneMap& map);
     virtual CNode* CopySkeleton();
 
-    /// The number of slots, null ones included. Every loop over children must pass over null slots.
+    /// Returns the number of slots, including null ones, which every loop over children must skip.
     size_t GetChildCount() const { return m_kChild.size(); }
-    /// The child in a slot, or null for an empty slot and for an index out of range.
+    /// Returns the child in a slot, or null for an empty slot or an index out of range.
     Ref<CSpatial> GetChild(size_t index) const;
-    /// The same without a count, for those who only look.
+    /// Returns the child in a slot without counting a reference. The index must be in range.
     CSpatial* ChildAt(size_t index) const { return m_kChild[index].Get(); }
-    /// Puts the child into the first null slot, or grows by two slots. False for null.
+    /// Puts a child into the first null slot, adding two slots if there is none. Returns false for null.
     bool AttachChild(CSpatial* child);
-    /// Empties every slot that holds the child; the array does not shrink. False for null only.
+    /// Empties every slot that holds the child; the array does not shrink. Returns false only for null.
     bool DetachChild(CSpatial* child);
-    /// Places a child, null included, and answers the previous occupant.
+    /// Sets a slot to a child or null and returns the previous child.
     Ref<CSpatial> SetChildAt(size_t index, CSpatial* child);
-    /// Whether no child is a node: a leaf bone.
+    /// Returns whether no child is a node, that is, whether this is a leaf bone.
     bool HasNoNodeChild() const;
-    /// The parent when that is a node, else null.
+    /// Returns the parent if it is a node, otherwise null.
     CNode* GetParentNode() const { return RecordCast<CNode>(GetParent()); }
 
     uint32_t m_uiGrowBy;
@@ -62,7 +62,7 @@ private:
     std::vector<Held<CSpatial>> m_kChild;
 };
 
-/// A node that files may ask for and that behaves as any other.
+/// A node class that files may contain; it behaves like any other node.
 class CBillboardNode : public CNode
 {
 public:

@@ -1,3 +1,9 @@
+// Object ids, attachment chains, cloning and search.
+//
+// Cloning runs in two steps: every held object is copied, recursively, and entered in a map from source id to
+// copy; then plain links in the copies are redirected to the copies of what they pointed to. A link to an
+// object outside the cloned part keeps pointing to the original.
+
 #include "CObject.h"
 
 #include "CControl.h"
@@ -33,7 +39,8 @@ std::vector<CLinkSlot> LinkSlots(CObject& object)
     return slots;
 }
 
-// Plain links of a copy lead to the copies of what they led to. What was not cloned stays where it is.
+// Redirects plain links in a copy to the copies of their targets. Links to objects that were not cloned stay
+// as they are.
 void FollowCopies(CObject& copy, const CCloneMap& map)
 {
     CLinkVisitor visitor([&](const CLinkSlot& slot) {
@@ -50,7 +57,7 @@ CObject* CloneOf(CCloneMap& map, CObject* object)
     return object ? object->Clone(map) : nullptr;
 }
 
-// Modifier chains go on through a control's next link and end at the first object that is no modifier.
+// Modifier chains follow a control's next link and end at the first object that is not a modifier.
 template <class F>
 void ForEachModifier(CObject* head, F visit)
 {
@@ -59,7 +66,7 @@ void ForEachModifier(CObject* head, F visit)
         visit(*modifier);
 }
 
-// Appends the objects that one keeps alive, in the order of its fields.
+// Appends the objects that an object keeps alive, in field order.
 void AppendHeld(CObject& object, std::vector<CObject*>& held)
 {
     CLinkVisitor visitor([&held](const CLinkSlot& slot) {
@@ -69,9 +76,9 @@ void AppendHeld(CObject& object, std::vector<CObject*>& held)
     object.Fields(visitor);
 }
 
-// The first object that fits, of one and everything that it keeps alive: each before what it holds, and once
-// for each of its places. The list of what lies ahead takes the place of a recursion, which deep graphs could
-// exhaust the stack with.
+// Returns the first match among an object and everything it keeps alive: each object before the ones it
+// holds, once per place. Uses an explicit list instead of recursion, because deep graphs could exhaust the
+// stack.
 template <class F>
 CObject* FindHeld(CObject& start, F fits)
 {
@@ -137,8 +144,8 @@ CObject::~CObject()
     m_spkControl = nullptr;
 }
 
-// The cursor stays on the id just taken: the next allocation finds it taken and steps over it, and an id that
-// is freed while the cursor stands on it is given out again at once.
+// The cursor stays on the id just assigned: the next allocation finds it in use and skips it. If it is freed
+// meanwhile, it is reused immediately.
 void CObject::TakeID()
 {
     while (g_abObjectIDInUse[g_uiNextObjectID])
@@ -165,7 +172,7 @@ CObject* CObject::Clone(CCloneMap& map)
     const bool isOutermost = map.empty();
     map[m_uiID] = copy;
     CloneHeld(map, *copy);
-    // What a plain link leads to may be cloned long after it.
+    // The target of a plain link can be cloned long after the link itself.
     for (auto entry = map.begin(); isOutermost && entry != map.end(); ++entry)
         FollowCopies(*entry->second, map);
     return copy;
@@ -174,14 +181,14 @@ CObject* CObject::Clone(CCloneMap& map)
 void CObject::CloneHeld(CCloneMap& map, CObject& copy)
 {
     copy.AttachControl(static_cast<CControl*>(CloneOf(map, m_spkControl.Get())));
-    // A file may have put any object at the head of the modifiers; only a control can be attached.
+    // A file can put any object at the head of the modifiers, but only a control can be attached.
     CObject* modifier = CloneOf(map, m_spkModifier.Get());
     if (!copy.AttachModifier(RecordCast<CControl>(modifier)))
         copy.m_spkModifier = modifier;
     copy.AttachCustomData(static_cast<CCustomData*>(CloneOf(map, m_spkCustomData.Get())));
 
-    // What comes behind the chains stands at the same place in both lists. A class whose copy starts with
-    // fewer slots (a node without children) fills in the rest itself.
+    // The fields after the chains have the same position in both lists. A class whose copy starts with fewer
+    // slots (a node without children) fills in the rest itself.
     const std::vector<CLinkSlot> from = LinkSlots(*this);
     const std::vector<CLinkSlot> to = LinkSlots(copy);
     for (size_t i = kChainCount; i < to.size() && i < from.size(); ++i)
@@ -231,7 +238,7 @@ void CObject::DumpHTML(const std::string& folder, COrnHTMLWriter& page)
 void CObject::DumpTable(CHTMLTables& tables)
 {
     std::string controls;
-    std::unordered_set<const CControl*> shown; // nobody has checked a chain made by hand
+    std::unordered_set<const CControl*> shown; // chains built by hand can contain cycles
     for (CControl* control = GetControl(); control && shown.insert(control).second;
          control = control->GetNext())
     {
@@ -253,7 +260,7 @@ uint64_t CObject::GetMemoryUsed() const
 uint64_t CObject::GetDiskUsed() const
 {
     CFieldCounter counter;
-    const_cast<CObject*>(this)->Fields(counter); // counting changes nothing
+    const_cast<CObject*>(this)->Fields(counter); // counting modifies nothing
     return 4 + std::strlen(GetRTTI()->m_pcName) + 4 + counter.ByteCount();
 }
 
@@ -343,7 +350,7 @@ bool CObject::AttachModifier(CControl* modifier)
 {
     CModifier* last = nullptr;
     ForEachModifier(m_spkModifier.Get(), [&](CModifier& link) { last = &link; });
-    // A file may have put any object at the head, and nothing can follow that.
+    // A file can put any object at the head, and not every object can have a successor.
     if (!modifier || modifier->GetTarget() || (m_spkModifier && !last))
         return false;
     for (CControl* link = modifier; link; link = link->GetNext())

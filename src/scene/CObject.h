@@ -21,23 +21,23 @@ class COrrinStream;
 class CWatcher;
 struct CLinkRecord;
 
-/// From the id of a source object to its copy, alive for one clone operation.
+/// Maps the id of a source object to its copy, for one clone operation.
 using CCloneMap = std::map<uint32_t, CObject*>;
 
-/// How deep objects may be nested by counted references: updates, searches and destructors recurse once per
-/// level. With the sanitizers on, the longest walk takes about 1.3 KiB of stack for each.
+/// The limit for the nesting of counted references: updates, searches and destructors recurse once per level.
+/// With sanitizers, the largest of them takes about 1.3 KiB of stack per level.
 inline constexpr size_t kNestingLimit = 4000;
 
-/// The number of ids that objects can have.
+/// The number of possible object ids.
 inline constexpr uint32_t kObjectIDCount = 8'388'608;
 
-extern uint8_t g_abObjectIDInUse[kObjectIDCount]; ///< one byte per possible id, non-zero while it is taken
-extern uint32_t g_uiNextObjectID;                 ///< where the search for a free id begins
-extern uint32_t g_uiObjectCount;                  ///< live objects
+extern uint8_t g_abObjectIDInUse[kObjectIDCount]; ///< one byte per id, nonzero while it is in use
+extern uint32_t g_uiNextObjectID;                 ///< where the search for a free id starts
+extern uint32_t g_uiObjectCount;                  ///< number of live objects
 
-/// The base of every scene thing: class record, reference count, id, name and three chains of attached
-/// objects. Born with count 0 and belonging to nobody; deletes itself when a release brings the count back to
-/// 0. Copying copies the class's own values under a fresh id, never the attachments.
+/// Base of all scene objects: class record, reference count, id, name and three chains of attached objects. A
+/// new object has count 0; it deletes itself when a release brings the count back to 0. Copying copies the
+/// class's own values and assigns a new id, but does not copy attachments.
 class CObject
 {
 public:
@@ -49,88 +49,89 @@ public:
     virtual ~CObject();
 
     virtual const CRTTI* GetRTTI() const { return &ms_kRTTI; }
-    /// A new object by the copy constructor, with count 0; null for abstract classes.
+    /// Returns a copy-constructed object with count 0; null for abstract classes.
     virtual CObject* CreateClone() const { return nullptr; }
-    /// Copies the object together with everything it holds. An object that the map already knows returns the
-    /// copy made before. Plain links of the copies point to other copies if there are any.
+    /// Copies the object with everything it holds. If the map already contains it, returns the earlier copy.
+    /// Plain links in the copies refer to other copies if they exist.
     virtual CObject* Clone(CCloneMap& map);
 
-    /// The class's stored fields, base first, in file order: the one place that says what a file holds.
+    /// Lists the class's stored fields, base class first, in file order. This is the only place that defines
+    /// the file layout.
     virtual void Fields(CFieldArchive& archive);
 
-    /// Reads the fields, collecting link ids in the record.
+    /// Reads the fields and collects link ids in the record.
     virtual void Load(COrrinStream& stream, CLinkRecord& record);
-    /// Turns the record's link ids into references; no other object need be linked already.
+    /// Resolves the record's link ids to references; other objects need not be linked yet.
     virtual void Link(COrrinStream& stream, CLinkRecord& record);
-    /// Enters the object and all that it holds in the stream's save list; false when it was known already.
+    /// Adds the object and everything it holds to the stream's save list; false if it was already there.
     virtual bool Register(COrrinStream& stream);
     virtual void Save(COrrinStream& stream);
 
-    /// Writes a small web site about this object and all below it, for developers. Only nodes do. The folder
-    /// stands straight before each file name, so it ends in a separator.
+    /// Writes a small web site about this object and everything below it, for developers. Only nodes do this.
+    /// File names are appended to the folder, so it must end with a separator.
     virtual void WriteHTMLFrames(const std::string&) {}
-    /// Adds the object's tables to a page and saves the pages of everything it links to, each once. While a
+    /// Adds the object's tables to a page and saves the pages of everything it links to, each once. If a
     /// larger dump is running, that dump saves the other pages.
     virtual void DumpHTML(const std::string& folder, COrnHTMLWriter& page);
-    /// Adds the tables of the object's classes, base first.
+    /// Adds the tables of the object's classes, base class first.
     virtual void DumpTable(CHTMLTables& tables);
 
-    /// Bytes in memory, by the fixed sizes of the object model.
+    /// Returns the bytes in memory, by the fixed sizes of the object model.
     virtual uint64_t GetMemoryUsed() const;
-    /// The bytes that Save writes, exactly.
+    /// Returns the exact number of bytes that Save writes.
     virtual uint64_t GetDiskUsed() const;
 
-    /// Brings the object and its chains up to a time. Always true unless a class says otherwise.
+    /// Updates the object and its chains to a time. Returns true unless a class documents otherwise.
     virtual bool Update(float time);
     virtual bool UpdateRange(uint32_t range, float time);
 
-    /// The first object, this one included, that has the name and the class; null name or record match
-    /// everything. With `derived` a class derived from the record's fits too. Depth first, attachments before
+    /// Returns the first object, starting with this one, with this name and class. A null name or record
+    /// matches everything. With `derived`, derived classes match too. Depth first, attachments before
     /// children.
     virtual CObject* FindObject(const char* name, const CRTTI* record, bool derived);
-    /// Appends all such objects.
+    /// Appends all matching objects.
     virtual void FindObjects(std::vector<CObject*>& found, const char* name, const CRTTI* record,
                              bool derived);
-    /// The objects that this one keeps alive, in search order, which is file order.
+    /// Returns the objects that this one keeps alive, in search order, which is file order.
     std::vector<CObject*> HeldObjects();
-    /// Lets references by name look up their objects under a root.
+    /// Resolves references by name under a root.
     virtual bool Bind(CObject& root);
-    /// Lets plain links of a finished copy lead to copies that a later clone with the same map has made.
+    /// Redirects plain links of a finished copy to copies that a later clone with the same map has made.
     virtual bool Rebind(const CCloneMap& map);
 
     const char* GetName() const { return m_pcName.Get(); }
-    /// The name's characters; none for a null name.
+    /// Returns the name; empty for a null name.
     std::string_view NameView() const { return m_pcName.View(); }
-    /// Stores a copy, or null.
+    /// Stores a copy of the name, or null.
     void SetName(const char* name) { m_pcName.Set(name); }
     uint32_t GetID() const { return m_uiID; }
 
     CControl* GetControl() const { return m_spkControl.Get(); }
     CObject* GetModifier() const { return m_spkModifier.Get(); }
     CCustomData* GetCustomData() const { return m_spkCustomData.Get(); }
-    /// Appends a control, with the chain behind it, to the control chain and targets it here. False for null
-    /// and for a control that has a target already.
+    /// Appends a control and its chain to the control chain and sets its target. Returns false for null or if
+    /// the control already has a target.
     bool AttachControl(CControl* control);
-    /// Does the same for the modifier chain, which ends at the first object that is not a modifier. False,
-    /// with nothing changed, also if the head itself is not a modifier.
+    /// Same for the modifier chain, which ends at the first object that is not a modifier. If the head itself
+    /// is not one, returns false and changes nothing.
     bool AttachModifier(CControl* modifier);
-    /// Makes a custom data object the head of its chain. With a head there already the end is looked for in
-    /// the control chain, as it has always been, and where that is no custom data nothing changes: false.
+    /// Makes a custom data object the head of its chain. If there is already a head, the end is searched in
+    /// the control chain, as it always was; if that is not custom data, returns false and changes nothing.
     bool AttachCustomData(CCustomData* data);
-    /// Lets go of the control chain; its controls lose their target.
+    /// Releases the control chain; its controls lose their target.
     void DetachControls();
 
     void Retain() { ++m_uiRefCount; }
     void Release();
     uint32_t GetRefCount() const { return m_uiRefCount; }
 
-    uint32_t m_uiChangeStamp = 0; ///< raised by a control each time it has rewritten this object; not copied
+    uint32_t m_uiChangeStamp = 0; ///< incremented by a control whenever it changes this object; not copied
 
 protected:
-    /// What Bind and Rebind pass the call to, in their order; entries may be null. Spatials name what they
-    /// add before what they inherit.
+    /// Appends the objects that Bind and Rebind call, in order; entries may be null. Spatials append their
+    /// own before the inherited ones.
     virtual void AppendBindOrder(std::vector<CObject*>& order);
-    /// Clones what this object holds into its copy.
+    /// Clones the objects that this one holds into its copy.
     virtual void CloneHeld(CCloneMap& map, CObject& copy);
 
 private:
@@ -149,7 +150,7 @@ private:
     CWatcher* m_pkWatchers = nullptr;
 };
 
-/// One entry in an object's list of those who point at it without holding it.
+/// An entry in an object's list of plain pointers to it.
 class CWatcher
 {
 public:

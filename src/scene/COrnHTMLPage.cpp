@@ -29,7 +29,7 @@ bool COrnHTMLPage::SaveAs(const std::string& path) const
     if (!stream)
         return false;
     WriteTo(stream);
-    return std::fclose(stream) == 0 && file.Commit(); // which fails if any write did
+    return std::fclose(stream) == 0 && file.Commit(); // fails if any write failed
 }
 
 void COrnHTMLPage::WriteTo(std::FILE* file) const

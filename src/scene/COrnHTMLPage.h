@@ -6,21 +6,21 @@
 
 namespace gw {
 
-/// A text page that is being made: lines, and pages that follow them.
+/// A text page under construction: lines, followed by nested pages.
 class COrnHTMLPage
 {
 public:
     virtual ~COrnHTMLPage() = default;
 
-    /// Writes the page to a file, replacing an old one in one step. False, with the old one kept, if the file
-    /// cannot be written or is not a regular file: a link could lead out of the folder.
+    /// Writes the page to a file, replacing an old one atomically. Returns false and keeps the old file if it
+    /// cannot be written or is not a regular file, since a link could point outside the folder.
     virtual bool SaveAs(const std::string& path) const;
     virtual bool SaveAsText(const char* path) const { return SaveAs(path); }
-    /// Prints the lines, each with its end, and then the nested pages.
+    /// Prints the lines with their line ends, then the nested pages.
     virtual void WriteTo(std::FILE* file) const;
 
     void AddLine(std::string line) { m_kLines.push_back(std::move(line)); }
-    /// A line as printf makes it.
+    /// Adds a line formatted as by printf.
     [[gnu::format(printf, 2, 3)]] void AddFormat(const char* format, ...);
     void AddPage(COrnHTMLPage page) { m_kPages.push_back(std::move(page)); }
 
@@ -29,7 +29,7 @@ private:
     std::vector<COrnHTMLPage> m_kPages;
 };
 
-/// The class through which pages are used.
+/// The page class that callers use.
 class COrnHTMLWriter : public COrnHTMLPage
 {
 };

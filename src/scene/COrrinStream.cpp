@@ -1,3 +1,22 @@
+// The container reader and writer.
+//
+// A scene is a graph: objects share children, controls point back at their targets. A file is flat: one
+// record per object, in which a reference is the id that the other object had when the file was written. Ids
+// mean nothing outside their file, and a record can refer to one that comes later. So reading takes two
+// passes. The first creates an object per record, by class name, lets it read its fields, and collects the
+// ids it read in a CLinkRecord. The second replaces the ids by references, in the same field order. An
+// unknown id becomes null, and so does an object of the wrong class; the first record with an id wins.
+//
+// Nothing in a file is trusted. Each count is checked against the bytes that are left before memory is
+// allocated, so the objects cannot take more than a fixed multiple of the file size, and reading ends because
+// every record consumes bytes. Unknown classes end the file, since the length of their record is not stored.
+// The finished graph is checked once more before anybody walks it: a file can make objects hold each other in
+// a cycle, nest them deeper than the stack allows, or share them so often that a walk never ends. Such a
+// graph is unlinked object by object, because even deleting it recursively could overflow the stack.
+//
+// Writing collects every object that the roots hold, in field order, gives each the id it has in memory, and
+// writes the records in that order. Roots are marked by a name in front of their class name.
+
 #include "COrrinStream.h"
 
 #include "CFieldReader.h"
@@ -14,15 +33,15 @@ namespace {
 
 constexpr char kHeaderText[] = "TKOrrin Version 1.20";
 constexpr std::string_view kHeader(kHeaderText, sizeof kHeaderText); // with its zero byte
-constexpr size_t kHeaderCompared = 16;                               // the digits of the version are free
+constexpr size_t kHeaderCompared = 16;                               // the version digits can differ
 constexpr size_t kLeastFileBytes = 21;
 constexpr std::string_view kRootMarker = "_OrrinRoot";
 constexpr std::string_view kThumbnailTag = "_OrrinThumbnail";
-// Leaves ids for clones and for what is built beside a file.
+// The other half of the ids is for clones and objects created besides a file.
 constexpr uint32_t kObjectLimit = kObjectIDCount / 2;
 
-// "%1d.%2d" as sscanf reads it: blanks and a sign may stand before either number and count against no width
-// but the digits' own, so " 1. 2" has its place here too.
+// Reads "%1d.%2d" as sscanf does: blanks and a sign may precede either number, and only digits count for the
+// width, so " 1. 2" is accepted.
 bool ScanDigits(const char*& text, int width, int& value)
 {
     while (*text == ' ' || (*text >= '\t' && *text <= '\r'))
@@ -57,8 +76,7 @@ CVersion ParseHeader(std::span<const std::byte> bytes)
     return version;
 }
 
-// Resolves ids into the slots of an object: plain values are passed over, links take the record's ids in
-// order.
+// Replaces ids by references in an object's slots: skips plain values and consumes the record's ids in order.
 class CLinkResolver : public CFieldArchive
 {
 public:
@@ -84,7 +102,7 @@ private:
     CLinkRecord& m_kRecord;
 };
 
-// Empties every counted slot of an object, so that a graph that must not stand falls apart without recursion.
+// Clears every counted slot of an object, so that a rejected graph can be deleted without recursion.
 void Unlink(CObject& object)
 {
     CLinkVisitor visitor([](const CLinkSlot& slot) {
@@ -164,7 +182,7 @@ bool COrrinStream::LoadFile(const std::string& path, bool thumbnailOnly)
     if (file.IsWhole())
         return true;
     RemoveAllRoots();
-    m_kRecord.Clear(); // of what the missing bytes looked like
+    m_kRecord.Clear(); // discard failures caused by the missing bytes
     return m_kRecord.Fail(EFailure::Changed);
 }
 
@@ -174,7 +192,7 @@ bool COrrinStream::LoadThumbnailOnly(std::span<const std::byte> bytes, size_t po
     if (position == 0)
         m_kVersion = kNewestVersion;
     CFieldReader reader(bytes, position, m_kVersion, m_kRecord);
-    reader.ReadString(); // the tag, which nobody compares
+    reader.ReadString(); // the tag, which is not checked
     m_kThumbnail = {};
     m_kThumbnail.Fields(reader);
     return true;
@@ -188,7 +206,7 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
     if (position == 0)
         m_kVersion = kNewestVersion;
     CFieldReader reader(bytes, position, m_kVersion, m_kRecord);
-    reader.ReadString(); // the tag, which nobody compares
+    reader.ReadString(); // the tag, which is not checked
     m_kThumbnail = {};
     m_kThumbnail.Fields(reader);
 
@@ -202,8 +220,8 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
     if (!sound && whole)
         DropGraph();
     m_kLinkTable.clear();
-    // Frees what no counted reference holds. Records go in file order; where links did not resolve to holders
-    // the objects go one by one and nothing recurses deeper than the graph that was checked.
+    // Deletes the objects without counted references. Records go in file order; objects that no link holds go
+    // one by one, so recursion is never deeper than the graph that was checked.
     m_kRecords.clear();
     return sound;
 }
@@ -218,7 +236,7 @@ bool COrrinStream::ReadObjects()
             return false;
         if (m_pkReader->IsDamaged())
         {
-            // The record in which reading stopped leaves nothing.
+            // Discard the incomplete last record.
             const CLinkRecord* last = m_kRecords.back().get();
             std::erase_if(m_kLinkTable, [=](const auto& entry) { return entry.second == last; });
             m_kRecords.pop_back();
@@ -239,9 +257,9 @@ CObject* COrrinStream::ReadNextObject(bool& marked)
         className = m_pkReader->ReadString();
     if (m_pkReader->IsDamaged())
         return nullptr;
-    // A class name is a C text: a zero byte ends it.
+    // A class name is a C string: a zero byte ends it.
     const std::string name(className.substr(0, className.find('\0')));
-    // An object takes an id, and the search for a free one only ends where there is one.
+    // Each object needs an id, and the search for a free one ends only if there is one.
     if (g_uiObjectCount >= kObjectLimit)
     {
         m_kRecord.Fail(EFailure::TooLarge, start, name);
@@ -352,7 +370,7 @@ void COrrinStream::RegisterRoots()
         root->Register(*this);
 }
 
-// The bytes behind the header, or nothing and a failure where a file cannot be that large.
+// Returns the number of bytes after the header, or nothing and a failure if it exceeds the limit.
 std::optional<size_t> COrrinStream::PlanBuffer()
 {
     m_kRecord.Clear();

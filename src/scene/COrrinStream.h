@@ -23,34 +23,34 @@ class CFieldReader;
 class CFieldWriter;
 class CMappedFile;
 
-/// What an object left behind while a file is loading: the link ids that it read, in its own order.
+/// The link ids that an object has read, in order, while a file is loading.
 struct CLinkRecord
 {
     uint32_t m_uiCursor = 0;    ///< next id to resolve
-    Ref<CObject> m_spkObject;   ///< kept alive until the links stand
-    bool m_bSubstitute = false; ///< an object that was there before stands for the one in the file
+    Ref<CObject> m_spkObject;   ///< kept alive until the links are resolved
+    bool m_bSubstitute = false; ///< an existing object replaces the one in the file
     std::vector<uint32_t> m_kLinkID;
 };
 
-/// How much memory the linked pictures of one scene take, of how much they may.
+/// How much memory the linked pictures of a scene take, and may take.
 struct PictureMemory
 {
-    /// Room for one picture of 64 megapixels, the largest that the codec reads, or for four of 4096 x 4096.
+    /// Enough for one picture of 64 megapixels, the largest that the codec reads, or four of 4096 x 4096.
     /// Without a limit, a scene of a few KB could take 256 MiB for each picture file of 200 KB that it names.
     static constexpr uint64_t kByteLimit = uint64_t{256} << 20;
 
     uint64_t m_uiByteLimit = kByteLimit;
     uint64_t m_uiBytesUsed = 0;
-    bool m_bFull = false; ///< one picture did not fit; the rest of the scene's pictures are not tried
+    bool m_bFull = false; ///< a picture did not fit; the scene's remaining pictures are not tried
 };
 
-/// Containers are at most this large, read or written: offsets in them are signed 32-bit.
+/// The maximum size of a container, read or written, because its offsets are signed 32-bit.
 inline constexpr uint64_t kContainerBytesLimit = 0x7fffffff;
 
 /// Reads and writes scene containers (.orn, .Kinetra): a flat sequence of object records that refer to each
-/// other by link ids. Reading and writing take two passes each: build and link, register and save. A stream
-/// keeps its roots; it can be used again. The bool answers are those of old; what really happened stands in
-/// Record().
+/// other by link ids. Reading takes two passes, build and link; so does writing, register and save. A stream
+/// keeps its roots and can be reused. The bool results follow an old convention; Record() says what really
+/// happened.
 class COrrinStream
 {
 public:
@@ -59,24 +59,25 @@ public:
     COrrinStream(const COrrinStream&) = delete;
     COrrinStream& operator=(const COrrinStream&) = delete;
 
-    /// False, with roots and version as they were, for a file that cannot be read, is too short, or whose
-    /// header or version is not supported. Otherwise true whatever reading the objects did: see Record() and
-    /// GetRoot.
+    /// Reads a file. Returns false, with roots and version unchanged, if it cannot be read, is too short, or
+    /// has an unsupported header or version. Otherwise returns true whatever happened to the objects: see
+    /// Record() and GetRoot.
     bool LoadFile(const std::string& path, bool thumbnailOnly);
-    /// The same from memory. Position 0 means a buffer without the header, in the newest version. True unless
+    /// Reads a buffer. Position 0 means that it has no header and is in the newest version. Returns false if
     /// reading ended early.
     bool LoadBuffer(std::span<const std::byte> bytes, size_t position);
     bool LoadThumbnailOnly(std::span<const std::byte> bytes, size_t position);
-    /// Replaces the file in one step. False when it cannot be written or the scene is too large.
+    /// Writes a file, replacing an old one atomically. Returns false if it cannot be written or the scene is
+    /// too large.
     bool SaveFile(const std::string& path);
-    /// The object part of a file, without the header. False when the scene is too large.
+    /// Writes the object part of a file, without the header. Returns false if the scene is too large.
     bool SaveBuffer(std::vector<std::byte>& out);
-    /// What stands before the object part of a file in the newest version.
+    /// Returns the bytes that precede the object part of a file in the newest version.
     static std::span<const std::byte> FileHeader();
 
-    /// False for null and for an object that is a root already.
+    /// Adds a root. Returns false for null and for an existing root.
     bool AddRoot(CObject* object);
-    /// The root, or null for an index out of range. No count is taken.
+    /// Returns a root, or null if the index is out of range. No reference is counted.
     CObject* GetRoot(size_t index) const;
     size_t GetRootCount() const { return m_kRoots.size(); }
     bool IsRoot(const CObject* object) const;
@@ -84,41 +85,42 @@ public:
 
     CVersion GetVersion() const { return m_kVersion; }
     COrrinThumbnail& Thumbnail() { return m_kThumbnail; }
-    /// The folder of the file last read or written, without the last separator.
+    /// Returns the folder of the last file read or written, without the last separator.
     const std::string& GetBaseDirectory() const { return m_kBaseDirectory; }
-    /// False for a stream that has seen no file but only memory: names in it lead nowhere.
+    /// Returns false if the stream has only read from memory, so file names in the scene cannot be resolved.
     bool HasBaseDirectory() const { return m_bHasBaseDirectory; }
-    /// What the last load or save failed on, with the byte and the class.
+    /// Returns the failure of the last load or save, with byte position and class.
     const CFailureRecord& Record() const { return m_kRecord; }
 
-    /// Sets how many bytes the linked pictures of each scene may take. 0 decodes none and reports none.
+    /// Limits the bytes that the linked pictures of each scene may take. 0 decodes no pictures and reports
+    /// none.
     void SetPictureLimit(uint64_t bytes) { m_kLinkedPictures.m_uiByteLimit = bytes; }
 
-    /// All objects that the roots hold, in save order, for reports. Empty between operations otherwise.
+    /// Returns all objects that the roots hold, in save order, for reports. Leaves the save list empty.
     std::vector<CObject*> ObjectsInSaveOrder();
 
-    // For the objects' own Load, Link, Register and Save.
+    // For use by the objects' Load, Link, Register and Save.
 
-    /// Reads id and fields of an object; the record's reference keeps the object until the links stand.
+    /// Reads the id and fields of an object. The record keeps the object alive until its links are resolved.
     void ReadObject(CObject& object, CLinkRecord& record);
     void ResolveLinks(CObject& object, CLinkRecord& record);
-    /// False when the object is in the list already.
+    /// Returns false if the object is already in the list.
     bool AppendToSaveList(CObject& object);
     void WriteObject(CObject& object);
-    /// Enters a record under an id; false when the id is taken: the first keeps it.
+    /// Registers a record under an id. Returns false if the id is taken; the first record keeps it.
     bool AddLink(uint32_t id, CLinkRecord& record);
-    /// The object of an id, or null for an unknown one and for 0.
+    /// Returns the object with an id, or null for 0 or an unknown id.
     CObject* FindLinkedObject(uint32_t id) const;
-    /// The id that an object has in the file being written; 0 for null and for what is not written.
+    /// Returns an object's id in the file being written; 0 for null or an object that is not written.
     uint32_t LinkID(const CObject* object) const;
-    /// Lets an object that is there already take the place of the one that the record was made for, which
-    /// lives no longer than that. What the other holds stays as it is.
+    /// Replaces the record's object by an existing one, which is not modified. The replaced object is
+    /// deleted.
     void Substitute(CLinkRecord& record, CObject& object);
-    /// A fresh record for an object that is about to read itself; the stream owns it.
+    /// Returns a new record for an object about to be read; owned by the stream.
     CLinkRecord& NewLinkRecord(CObject& object);
-    /// The memory of the linked pictures that the load in progress has read.
+    /// Returns the memory use of the linked pictures in the current load.
     PictureMemory& LinkedPictures() { return m_kLinkedPictures; }
-    /// Keeps a warning about the load in progress.
+    /// Records a warning about the current load.
     void Warn(EFailure reason, std::string name) { m_kRecord.Warn(reason, 0, std::move(name)); }
 
 private:
@@ -144,14 +146,14 @@ private:
     std::unordered_map<const CObject*, uint32_t> m_kSaveID;
     std::string m_kBaseDirectory;
     bool m_bHasBaseDirectory = false;
-    PictureMemory m_kLinkedPictures;    // of the load in progress or the last one
-    CMappedFile* m_pkFile = nullptr;    // while reading one
+    PictureMemory m_kLinkedPictures;    // of the current or last load
+    CMappedFile* m_pkFile = nullptr;    // while reading a file
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing
     CFailureRecord m_kRecord;
 };
 
-/// The factory of a concrete class.
+/// Returns the factory of a concrete class.
 template <class T>
 CObject* MakeObject(COrrinStream& stream)
 {

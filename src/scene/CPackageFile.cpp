@@ -1,5 +1,5 @@
-// The motion is the last thing in a package, so that all before it, the head, can be written before the
-// motion is known. Only its size stands in the head, and is written there when it has come.
+// The motion is last in a package, so everything before it, the head, is written before the motion is known.
+// The head contains the motion's size, which is filled in at the end.
 
 #include "CPackageFile.h"
 
@@ -26,7 +26,7 @@ struct InfoBlock
 };
 static_assert(sizeof(InfoBlock) == 16);
 
-// The end of the head. A block without bytes is not there at all.
+// The end of the head. If a block has no bytes, this part is missing.
 struct MotionSize
 {
     uint32_t m_uiByteCount;
@@ -43,7 +43,7 @@ Ref<CRawData> MakeBlock(const char* name, std::span<const std::byte> bytes)
     return block;
 }
 
-// A package whose motion has no bytes.
+// Returns a package with an empty motion.
 std::vector<std::byte> EmptyPackage(const PackageInfo& info)
 {
     const InfoBlock block{.m_uiFormat = info.format, .m_fThird = info.third, .m_fFourth = info.fourth};

@@ -10,31 +10,32 @@
 
 namespace gw {
 
-/// What stands in the info block of a package.
+/// The info block of a package.
 struct PackageInfo
 {
-    uint32_t format = 0; ///< of the motion file: FormatCode
+    uint32_t format = 0; ///< the motion file's format: FormatCode
     float third = 0.0f;
     float fourth = 0.0f;
 };
 
-/// The code of a motion file's format by the end of its name, 0 for an unknown one.
+/// Returns the code of a motion file's format by its extension; 0 if unknown.
 uint32_t FormatCode(const std::string& path);
 
-/// A Kinetra package on its way into a file that is replaced in one step: a container with an empty node and
-/// the custom data "MotionInfo" and "MotionFile". The motion comes in pieces and is never in memory as a
-/// whole, nor does it lie in a file of its own.
+/// Writes a Kinetra package: a container with an empty node and the custom data "MotionInfo" and
+/// "MotionFile". The destination is replaced atomically. The motion arrives in pieces, so it needs neither
+/// memory nor a temporary file.
 class CPackageFile
 {
 public:
-    /// Starts writing beside a destination, with all that stands before the motion.
+    /// Starts writing next to a destination, with everything that precedes the motion.
     bool Open(const std::string& path, const PackageInfo& info);
-    /// The next bytes of the motion. False where the file system does not take them or no container is that
-    /// large; Commit will then fail too.
+    /// Appends bytes of the motion. Returns false if they cannot be written or exceed the container limit;
+    /// Commit will then fail too.
     bool Write(std::span<const std::byte> motion);
-    /// Tells the motion's size and puts the file in its place. False leaves the destination untouched.
+    /// Writes the motion's size and moves the file into place. If that fails, returns false and leaves the
+    /// destination unchanged.
     bool Commit();
-    /// Why it failed: TooLarge or WriteError.
+    /// Returns the reason of the failure: TooLarge or WriteError.
     EFailure Failure() const { return m_eFailure; }
 
 private:

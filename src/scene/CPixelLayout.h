@@ -6,21 +6,21 @@ namespace gw {
 
 class CFieldArchive;
 
-/// The number of pixel formats, which have 4, 3, 2, 2, 2 and 1 bytes a pixel.
+/// The number of pixel formats, which use 4, 3, 2, 2, 2 and 1 bytes per pixel.
 inline constexpr int32_t kPixelFormats = 6;
-/// Bytes of a pixel; 0 for a format that there is not.
+/// Returns the bytes per pixel; 0 for an unknown format.
 int32_t BytesPerPixel(int32_t format);
 
-/// How pixels lie in memory and in a container: size, format, alignment of rows, resolution.
+/// The layout of pixels in memory and in a container: size, format, row alignment, resolution.
 struct CPixelLayout
 {
     /// The stored fields, in file order.
     void Fields(CFieldArchive& archive);
-    /// Bytes of a row: width x bytes per pixel, rounded up to a multiple of 4 under row alignment. Below 0
-    /// for a width below 0 and for a format that there is not.
+    /// Returns the bytes per row: width x bytes per pixel, rounded up to a multiple of 4 with row alignment.
+    /// Negative for a negative width or an unknown format.
     int64_t Stride() const;
-    /// Behind a presence word that says that pixels follow: how many rows of Stride() bytes they are. None,
-    /// and damage, where that cannot be told or the file cannot hold them.
+    /// Call after a presence word that announces pixels. Returns the number of rows of Stride() bytes that
+    /// follow, or 0 and a failure if it cannot be determined or the file is too short.
     int32_t RowsThatFollow(CFieldArchive& archive) const;
 
     int32_t m_iWidth = 0;

@@ -4,20 +4,19 @@ namespace gw {
 
 class CObject;
 
-/// The run-time record of a scene class. Two classes are the same exactly when their record addresses are
-/// equal.
+/// The run-time record of a scene class. Two classes are the same if their records have the same address.
 struct CRTTI
 {
     const char* m_pcName;  ///< class name, as written into container files
     const CRTTI* m_pkBase; ///< record of the direct base class, null for CObject
 };
 
-/// Whether a record equals an object's class record or one on its base chain.
+/// Returns whether a record is the object's class record or one of its bases.
 bool IsDerivedFrom(const CObject& object, const CRTTI* record);
-/// The object when IsDerivedFrom holds, else null; a null record yields null.
+/// Returns the object if IsDerivedFrom holds, otherwise null; a null record yields null.
 CObject* DynamicCast(CObject& object, const CRTTI* record);
 
-/// The object as a T when its class records say that it is one, else null. Null in, null out.
+/// Returns the object as a T if its class records allow it, otherwise null. Null yields null.
 template <class T>
 T* RecordCast(CObject* object)
 {

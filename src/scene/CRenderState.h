@@ -7,33 +7,31 @@
 
 namespace gw {
 
-/// The number of render state types, and of the slots that a geometry has for them.
+/// The number of render state types, and of a geometry's slots for them.
 inline constexpr size_t kRenderStateTypes = 7;
 
-/// One kind of drawing state. No concrete class derives from it; lists and slots of it exist for files and
-/// callers.
+/// A drawing state. It has no concrete classes; its lists and slots exist for files and callers.
 class CRenderState : public CObject
 {
 public:
     static const CRTTI ms_kRTTI;
 
     const CRTTI* GetRTTI() const override { return &ms_kRTTI; }
-    /// 0 to 6: which of the slots this state belongs in.
+    /// Returns the slot that this state belongs in, 0 to 6.
     virtual size_t GetType() const = 0;
 };
 
-/// The states in force at one place of the render state walk, a stack for each type. Entry 0 is the type's
-/// default.
+/// The render states in effect during the render walk: one stack per type. Entry 0 is the type's default.
 class RenderStateStack
 {
 public:
     RenderStateStack();
 
-    /// A full stack (127 states above the default) drops the push.
+    /// Pushes a state; ignored if the stack is full (127 states above the default).
     void Push(CRenderState& state);
-    /// A stack with nothing above its default stays as it is.
+    /// Pops a state; ignored if only the default is left.
     void Pop(const CRenderState& state);
-    /// The state in force, or null for an empty default.
+    /// Returns the state in effect, or null if the default is empty.
     CRenderState* Top(size_t type) const;
 
 private:

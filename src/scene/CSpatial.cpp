@@ -1,3 +1,6 @@
+// Scene updates run in three passes over a subtree: world matrices top down, then the controls that are not
+// transforms, then bounds bottom up. Render states are found by walking up the parent chain.
+
 #include "CSpatial.h"
 
 #include "CControl.h"
@@ -16,8 +19,7 @@ const CRTTI CSpatial::ms_kRTTI{"CSpatial", &CObject::ms_kRTTI};
 CSpatial::CSpatial() = default;
 CSpatial::~CSpatial() = default;
 
-// Parent and render states stay away: a copy belongs to nobody, and cloning attaches the copies of the
-// states.
+// Parent and render states are not copied: a copy has no parent, and cloning attaches the copied states.
 CSpatial::CSpatial(const CSpatial& source)
     : CObject(source), m_kMatrix(source.m_kMatrix), m_kWorldMatrix(source.m_kWorldMatrix),
       m_kBound(source.m_kBound), m_bStoredFlag(source.m_bStoredFlag), m_bForceCull(source.m_bForceCull)
@@ -27,9 +29,9 @@ CSpatial::CSpatial(const CSpatial& source)
 void CSpatial::CloneHeld(CCloneMap& map, CObject& copy)
 {
     CSpatial& spatial = static_cast<CSpatial&>(copy);
-    spatial.m_pkRenderStates.resize(m_pkRenderStates.size()); // the links after them are matched by position
+    spatial.m_pkRenderStates.resize(m_pkRenderStates.size()); // later links are matched by position
     CObject::CloneHeld(map, copy);
-    // Attaching puts each state at the front, so the copy's list is in reverse order.
+    // Attaching prepends each state, so the copy's list is in reverse order.
     for (const auto& state : std::exchange(spatial.m_pkRenderStates, {}))
     {
         if (state)

@@ -11,7 +11,7 @@ namespace gw {
 
 class CTriMesh;
 
-/// What the render walk hands geometry to.
+/// Receives geometry from the render walk.
 class CRenderer
 {
 public:
@@ -19,8 +19,8 @@ public:
     virtual void DrawTriMesh(CTriMesh& mesh) = 0;
 };
 
-/// An object with a place in space. World matrix and bound are valid after an UpdateScene and stale after any
-/// change of m_kMatrix until the next one; files do not store them.
+/// An object with a position in space. World matrix and bound are valid after UpdateScene, and stale after
+/// m_kMatrix changes until the next UpdateScene. They are not stored in files.
 class CSpatial : public CObject
 {
 public:
@@ -37,35 +37,35 @@ public:
     bool UpdateRange(uint32_t range, float time) override;
 
     virtual void Render(CRenderer&) {}
-    /// Runs the controls of the chain and computes the world matrix, unless two or more of them rewrote the
+    /// Runs the control chain and computes the world matrix, unless two or more controls changed the
     /// transform: then the world matrix keeps its old value.
     virtual void UpdateTransform(float time);
     virtual void UpdateBound() = 0;
     virtual void ApplyRenderStates(RenderStateStack& stack) = 0;
 
-    /// Brings transforms, then controls, then bounds below here to a time; with `upward` also the ancestors'
-    /// bounds.
+    /// Updates transforms, then controls, then bounds of this subtree to a time; with `upward`, the bounds of
+    /// the ancestors too.
     void UpdateScene(float time, bool upward);
-    /// Pushes this object's states, or with null those of the whole parent chain on a new stack, applies what
-    /// is in force and pops again.
+    /// Pushes this object's states, or without a stack those of the whole parent chain on a new one; applies
+    /// the states in effect, then pops.
     void PushAndApply(RenderStateStack* stack);
-    /// At most one state of each type: the one replaced is answered, or null.
+    /// Attaches a state. At most one state per type is kept; returns the replaced one, or null.
     Ref<CRenderState> AttachRenderState(CRenderState& state);
 
     CSpatial* GetParent() const { return m_pkParent; }
-    /// For those who hold this object as a child; it takes no count.
+    /// Sets the parent, without counting a reference. Called by the parent.
     void SetParent(CSpatial* parent) { m_pkParent = parent; }
 
     Mat4 m_kMatrix = kMat4Identity;      ///< relative to the parent
     Mat4 m_kWorldMatrix = kMat4Identity; ///< m_kMatrix · parent's m_kWorldMatrix
-    BoundSphere m_kBound;                ///< in the world
+    BoundSphere m_kBound;                ///< in world space
     bool m_bStoredFlag = true;           ///< stored and copied only
-    bool m_bForceCull = false;           ///< the render walk skips this object with all below it
+    bool m_bForceCull = false;           ///< the render walk skips this subtree
 
 protected:
     void CloneHeld(CCloneMap& map, CObject& copy) override;
     void AppendBindOrder(std::vector<CObject*>& order) override;
-    /// World matrix from the local one and the parent's.
+    /// Computes the world matrix from the local one and the parent's.
     void UpdateWorldMatrix();
 
 private:

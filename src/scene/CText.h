@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// An owned text that may be null. A null text and an empty one are both legal and differ only in searches.
+/// An owned text that may be null. Null and empty are both valid and differ only in searches.
 class CText
 {
 public:
@@ -17,7 +17,7 @@ public:
         m_bNull = !text;
         m_kText = text ? text : "";
     }
-    /// Takes bytes as read from a file: none give a null text, a zero byte ends it.
+    /// Sets the text to bytes from a file: no bytes make it null, a zero byte ends it.
     void SetBytes(std::string_view bytes)
     {
         m_bNull = bytes.empty();
@@ -25,11 +25,11 @@ public:
     }
 
     bool IsNull() const { return m_bNull; }
-    /// The text with its terminator, or null.
+    /// Returns the null-terminated text, or null.
     const char* Get() const { return m_bNull ? nullptr : m_kText.c_str(); }
-    /// The characters; none for a null text.
+    /// Returns the characters; empty for a null text.
     std::string_view View() const { return m_kText; }
-    /// What GetMemoryUsed counts: the characters and the terminator when set, else 0.
+    /// Returns the size for GetMemoryUsed: characters plus terminator, or 0 for null.
     size_t MemoryUsed() const { return m_bNull ? 0 : m_kText.size() + 1; }
 
 private:

@@ -8,8 +8,8 @@
 
 namespace gw {
 
-/// What controls with one track of vectors share. It has no class record of its own: those derived from it
-/// name CControl as their base.
+/// Base of controls with one track of vectors. It has no class record: derived classes name CControl as their
+/// base.
 class CVectorKeyControl : public CControl
 {
 public:
@@ -18,12 +18,12 @@ public:
     bool UpdateTransform(float) override { return false; }
 
     std::vector<Vec3> m_kKeys;
-    std::vector<float> m_kKeyTimes; ///< ascending, one for each key
+    std::vector<float> m_kKeyTimes; ///< ascending, one per key
 
 protected:
-    /// Keys without times, or times without keys, count as none.
+    /// Returns whether there are both keys and times.
     bool HasKeys() const { return !m_kKeys.empty() && !m_kKeyTimes.empty(); }
-    /// The value at a caller's time; `empty` where there are no keys.
+    /// Returns the value at a caller's time; `empty` without keys.
     Vec3 ValueAt(float time, const Vec3& empty);
 
 private:

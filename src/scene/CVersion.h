@@ -13,7 +13,7 @@ struct CVersion
     constexpr bool AtLeast(CVersion other) const { return Number() >= other.Number(); }
 };
 
-/// The newest version, which is what is written.
+/// The newest version, which is always written.
 inline constexpr CVersion kNewestVersion{1, 20};
 
 } // namespace gw

@@ -15,7 +15,7 @@ constexpr std::string_view kTags[][2] = {
     {"<!--", "-->"  }, // Comment
 };
 
-constexpr std::string_view kHere = ".\\"; // browsers take the backslash as they take a slash
+constexpr std::string_view kHere = ".\\"; // browsers treat the backslash like a slash
 
 } // namespace
 

@@ -8,7 +8,7 @@ namespace gw {
 
 class CObject;
 
-/// The elements of a page that have two ends.
+/// Elements with a start and an end tag.
 enum class EHTMLElement : uint8_t
 {
     Heading,
@@ -27,32 +27,32 @@ enum class EHTMLEnd : uint8_t
 std::string HTMLLineBreak();
 std::string HTMLRule();
 std::string HTMLTag(EHTMLElement element, EHTMLEnd end);
-/// The text with the tags of the element around it.
+/// Returns the text enclosed in the element's tags.
 std::string HTMLEnclosed(EHTMLElement element, std::string_view text);
-/// A table that opens with a caption and closes the caption at its end: the rows stand inside, which browsers
-/// put right.
+/// Returns a table's start or end tags. The start opens a caption that only the end closes, so the rows are
+/// inside it; browsers repair that.
 std::string HTMLTable(EHTMLEnd end, unsigned border);
 std::string HTMLUnsigned(uint32_t value);
-/// A link without its closing tag. A bare name gets the folder and the extension of the pages.
+/// Returns a link without its closing tag. The folder and extension of the pages are added to a bare name.
 std::string HTMLAnchor(std::string_view url, std::string_view text);
 
 enum class EHTMLPath : uint8_t
 {
     Bare,
-    Relative, ///< to the folder of the page that names it
+    Relative, ///< to the folder of the linking page
 };
 
-/// The file of an object's page. It follows the object's id, so that another load gives other names.
+/// Returns the name of an object's page. It contains the object's id, so it differs after another load.
 std::string GetHTMLFileName(const CObject& object, EHTMLPath path);
 
-/// An anchor to an object's page under its class and name, or "NULL".
+/// Returns a link to an object's page, labeled with its class and name, or "NULL".
 std::string HTMLObjectAnchor(const CObject* object);
 
-/// The line by which a page tells its code page.
+/// Declares the code page of a page.
 inline constexpr char kHTMLCodePage[] =
     R"(<meta http-equiv="Content-Type" content="text/html; charset=big5">)";
 
-// What the pages say in Big5, whose characters take two bytes each.
+// Labels of the pages in Big5, which uses two bytes per character.
 
 inline constexpr char kHTMLMembers[] = "\xA6\xA8\xAD\xFB\xB8\xEA\xAE\xC6";    ///< member data
 inline constexpr char kHTMLObjectName[] = "\xAA\xAB\xA5\xF3\xA6\x57\xBA\xD9"; ///< object name

@@ -1,3 +1,6 @@
+// Escapes names for pages and scripts. The pages are in Big5, where the second byte of a character can look
+// like ASCII markup, so everything outside printable ASCII is written as an escape.
+
 #include "HTMLText.h"
 
 #include "Numbers.h"
@@ -28,7 +31,7 @@ constexpr EscapeRow kPageEscapes[] = {
     {'"', "&quot;"},
 };
 
-// The code points of a name in a character set of the C library; nothing if its bytes are not of that set.
+// Decodes a name in a character set of the C library; nothing if its bytes are not valid in it.
 std::optional<std::u32string> CodePoints(std::string_view name, const char* characterSet)
 {
     constexpr size_t kPointsPerByte = 2; // at most, in Big5: a letter with its accent
@@ -37,7 +40,7 @@ std::optional<std::u32string> CodePoints(std::string_view name, const char* char
     if (converter == reinterpret_cast<iconv_t>(-1))
         return std::nullopt;
     std::u32string points(kPointsPerByte * name.size(), U'\0');
-    char* from = const_cast<char*>(name.data()); // the interface is older than const
+    char* from = const_cast<char*>(name.data()); // the interface predates const
     char* to = reinterpret_cast<char*>(points.data());
     size_t fromBytes = name.size();
     size_t toBytes = points.size() * sizeof(char32_t);
@@ -62,9 +65,10 @@ void AppendToPage(std::string& out, char character)
     out += character;
 }
 
-// A browser reads a page's bytes as Big5, where the second byte of a character may be a backslash, a letter
-// or a brace. After a byte above 7F an escape would therefore not be one, and a quote would end the text. So
-// a script gets no such bytes, and no "<" either, because a script element looks for its end in texts too.
+// Browsers read a page's bytes as Big5, where the second byte of a character can be a backslash, a letter or
+// a brace. After a byte above 7F, an escape would not be recognized and a quote would end the text. So
+// scripts contain no such bytes, and no "<" either, because a script element's end is searched even inside
+// texts.
 bool IsPlainInScript(char32_t point)
 {
     return point >= U' ' && point <= U'~' && point != U'"' && point != U'\\' && point != U'<';

@@ -22,7 +22,7 @@ KeySpan FindKeys(float time, const std::vector<float>& times, KeyCursor& cursor)
     if (time >= times[last])
         return {0.0f, cursor = last, last};
     uint32_t i = std::min(cursor, last);
-    // The bounds on j hold by themselves on an ascending axis; a file's axis may be none.
+    // On an ascending axis j cannot leave the range; an axis from a file may not be ascending.
     if (time > times[i])
     {
         uint32_t j = i + 1;

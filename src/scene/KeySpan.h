@@ -9,11 +9,10 @@
 
 namespace gw {
 
-/// A search position on a time axis that stays where it was, so that sequential play costs one compare or
-/// two.
+/// The last search position on a time axis. Keeping it makes sequential playback cost one or two comparisons.
 using KeyCursor = uint32_t;
 
-/// The keys around a key time: it lies at `fraction` between indices a and b.
+/// The keys around a key time, which lies at `fraction` between indices a and b.
 struct KeySpan
 {
     float fraction;
@@ -21,12 +20,12 @@ struct KeySpan
     uint32_t b;
 };
 
-/// The keys around a time on an ascending axis, which must not be empty. On an axis that is not ascending, as
-/// files may have it, the indices still lie within.
+/// Returns the keys around a time on an ascending axis, which must not be empty. On an axis that is not
+/// ascending, as some files have, the indices are still in range.
 KeySpan FindKeys(float time, const std::vector<float>& times, KeyCursor& cursor);
 
-/// A key by its index. Files may hold fewer keys than times: the last key stands in for those that are
-/// missing. There must be one.
+/// Returns a key by index. Files can have fewer keys than times: the last key then stands in for missing
+/// ones. There must be at least one key.
 template <class T>
 const T& KeyAt(const std::vector<T>& keys, uint32_t index)
 {
@@ -39,7 +38,7 @@ const T& KeyAt(const CKeyArray<T>& keys, uint32_t index)
     return keys[index];
 }
 
-/// The value between two keys; `empty` where there are none. Keys is a vector or a CKeyArray.
+/// Returns the value between two keys; `empty` without keys. Keys is a vector or a CKeyArray.
 template <class Keys, class T>
 T LinearKey(const Keys& keys, const KeySpan& span, const T& empty)
 {

@@ -7,8 +7,8 @@ namespace gw {
 
 class CObject;
 
-/// A counted reference: keeps a scene object alive. Assignment counts the new object before it drops the old
-/// one; an object whose count falls to 0 deletes itself. T may be forward-declared where the reference is
+/// A counted reference: keeps a scene object alive. Assignment counts the new object before it releases the
+/// old one; an object whose count falls to 0 deletes itself. T may be forward-declared where the reference is
 /// only declared.
 template <class T>
 class Ref
@@ -74,8 +74,8 @@ private:
     T* m_pkObject = nullptr;
 };
 
-/// A counted reference of one scene object to another. A copy of the holder starts without it, since copying
-/// an object copies its own values and never what is attached to it; cloning fills it in.
+/// A counted reference from one scene object to another. It is not copied with its owner, since copying an
+/// object never copies attachments; cloning fills it in.
 template <class T>
 class Held : public Ref<T>
 {

@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A plain pointer of one scene object to another that holds no count and becomes null when the other dies.
-/// Like Held it is not copied with its holder; cloning hands it on. It moves, so that arrays of it may grow.
+/// A pointer from one scene object to another that is not counted and becomes null when the other dies. Like
+/// Held, it is not copied with its owner; cloning sets it. It can be moved, so arrays of it can grow.
 template <class T>
 class Watch
 {

@@ -1,3 +1,6 @@
+// The picture codec, on top of Magick++. The library allocates whatever a file claims and reports problems by
+// exceptions, so its resources are limited at start and every call is wrapped.
+
 #include "CPictureCodec.h"
 
 #include <algorithm>
@@ -13,8 +16,8 @@ namespace gw {
 
 namespace {
 
-// Pixels take 8 bytes each while they are decoded. Beyond the memory they stand in a file: a picture of 64
-// megapixels is read, one that claims more is refused before anything is taken.
+// Pixels take 8 bytes each while they are decoded. Beyond this limit they are cached in a file: a picture of
+// 64 megapixels can be read, and a larger one is refused before anything is allocated.
 constexpr MagickCore::MagickSizeType kMemoryBytes = MagickCore::MagickSizeType{32} << 20;
 constexpr MagickCore::MagickSizeType kDiskBytes = MagickCore::MagickSizeType{512} << 20;
 constexpr MagickCore::MagickSizeType kFrameLimit = 4096; // each costs 13 KB, whatever its size
@@ -25,7 +28,7 @@ void Initialize()
 {
     Magick::InitializeMagick(nullptr);
     Magick::ResourceLimits::memory(kMemoryBytes);
-    Magick::ResourceLimits::map(0); // a mapped file on a full disk is a signal, not an answer
+    Magick::ResourceLimits::map(0); // a mapped file on a full disk raises a signal instead of an error
     Magick::ResourceLimits::disk(kDiskBytes);
     Magick::ResourceLimits::listLength(kFrameLimit);
     Magick::ResourceLimits::thread(1);
@@ -52,7 +55,7 @@ PictureHead HeadOf(const Magick::Image& image)
             .verticalResolution = DotsPerInch(image.yResolution(), image.resolutionUnits())};
 }
 
-// A cut picture is a warning, and what there is of it comes all the same.
+// A truncated picture is only a warning, and the available part is returned.
 template <class F>
 void Attempt(F step)
 {
@@ -81,14 +84,14 @@ std::vector<Magick::Image> ReadFrames(const Magick::Blob& blob, const char* form
     return frames;
 }
 
-// What a picture without alpha has in its place may be anything.
+// Without an alpha channel, its bytes can be anything.
 void MakeOpaque(uint8_t* pixels, size_t count)
 {
     for (uint8_t* alpha = pixels + 3; count > 0; --count, alpha += 4)
         *alpha = 255;
 }
 
-// The export below copies the channels as they are: cyan would come out as red.
+// The export below copies channels unchanged: cyan would become red.
 void ConvertToSRGB(Magick::Image& image)
 {
     const Magick::ColorspaceType space = image.colorSpace();
@@ -117,7 +120,7 @@ bool DecodeFrames(std::span<const std::byte> file, const char* format, bool ever
     return !frames.empty() && std::ranges::all_of(frames, [&](auto& frame) { return HandOver(frame, sink); });
 }
 
-// Of a picture with few colours the file keeps exactly these; of others the nearest, without a pattern.
+// A picture with few colors keeps them exactly; others get the nearest ones, without dithering.
 void PrepareGif(Magick::Image& image)
 {
     constexpr size_t kColors = 256;

@@ -1,4 +1,4 @@
-// The half of CBMPPicture that writes.
+// The writing half of CBMPPicture.
 
 #include "CBMPPicture.h"
 
@@ -69,7 +69,7 @@ bool CBMPPicture::SetSize(const PictureBox& box)
     return true;
 }
 
-// Rows come in their order. What a row does not fill is black.
+// Rows are written in order. The part of a row without pixels is black.
 bool CBMPPicture::BeginRow(int y, int x, int count)
 {
     if (!m_pkOut || m_bFailed || y != m_iRow || !IsInside(y, x, count, Box()))
@@ -81,7 +81,7 @@ bool CBMPPicture::BeginRow(int y, int x, int count)
     return true;
 }
 
-// Always top down, which a negative height says.
+// Always top down, marked by a negative height.
 bool CBMPPicture::WriteHeader()
 {
     const uint64_t rowSize =

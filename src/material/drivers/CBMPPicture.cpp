@@ -1,4 +1,4 @@
-// Opening, closing and reading; BMPWriter.cpp has the rest.
+// Opens, closes and reads BMP files; BMPWriter.cpp writes them.
 
 #include "CBMPPicture.h"
 
@@ -14,11 +14,11 @@ namespace {
 constexpr uint16_t kBMPType = 19778; // "BM"
 constexpr uint32_t kInfoHeaderBytes = 40;
 constexpr int kDepths[] = {1, 2, 4, 8, 16, 24, 32};
-constexpr uint64_t kStreamRowLimit = uint64_t{1} << 25; // of a stream that does not tell what it holds
+constexpr uint64_t kStreamRowLimit = uint64_t{1} << 25; // for a stream of unknown size
 
 static_assert(sizeof(BMPInfoHeader) == kInfoHeaderBytes);
 
-// Five bits as eight: the high ones fill up the low ones, so that the ends are 0 and 255.
+// Expands five bits to eight by repeating the high bits, so that the ends are 0 and 255.
 constexpr std::array<uint8_t, 32> MakeFiveBitTable()
 {
     std::array<uint8_t, 32> table{};
@@ -53,7 +53,7 @@ bool CBMPPicture::ReadHeader()
         return false;
     if (m_kInfoHeader.bitCount < 16 && !ReadPalette())
         return false;
-    // Forward only: where the offset lies before this place, the pixels follow at once.
+    // Only forward: if the offset is before the current position, the pixels follow immediately.
     m_kFileHeader.offset = std::max(m_kFileHeader.offset, static_cast<uint32_t>(m_kInput.Position()));
     if (!m_kInput.Seek(m_kFileHeader.offset))
         return false;
@@ -79,7 +79,7 @@ bool CBMPPicture::ReadFileHeader()
 
 bool CBMPPicture::ReadInfoHeader()
 {
-    // A smaller header has other fields: an old format of the same name.
+    // A smaller header has other fields: an older format with the same name.
     if (!m_kInput.ReadValue(m_kInfoHeader) || m_kInfoHeader.size < kInfoHeaderBytes)
         return false;
     if (m_kInfoHeader.compression == 0)
@@ -110,8 +110,8 @@ bool CBMPPicture::TakeSize()
     return true;
 }
 
-// As many entries as the depth can tell apart. A file may hold fewer, which shows by the place of its pixels;
-// one without any is a picture in grey.
+// As many entries as the bit depth can address. A file can have fewer, shown by the position of its pixels;
+// without any, the picture is gray.
 bool CBMPPicture::ReadPalette()
 {
     const size_t count = size_t{1} << m_kInfoHeader.bitCount;
@@ -134,14 +134,14 @@ bool CBMPPicture::ReadPalette()
     return true;
 }
 
-// The stored rows count from the start of the file's block; of a stream that stands bottom up, from its end.
+// Stored rows count from the start of the file's block; for a stream that is bottom up, from its end.
 bool CBMPPicture::ReadRowBytes(int y, int x, int count)
 {
     if (!m_bReading || !IsInside(y, x, count, Box()))
         return false;
     const int row = m_kInput.IsStream() && !m_bTopDown ? m_iHeight - y - 1 : y;
     if (row == m_iHeldRow)
-        return true; // a pipe cannot go back to it
+        return true; // a pipe cannot seek back
     if (!m_kInput.Seek(m_kFileHeader.offset + uint64_t{m_uiRowSize} * static_cast<uint64_t>(row)))
         return false;
     const bool read = m_kInput.Read(std::as_writable_bytes(std::span(m_kRow)));

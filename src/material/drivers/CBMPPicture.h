@@ -11,7 +11,7 @@
 
 namespace gw {
 
-/// What a BMP file begins with: 14 bytes, without gaps.
+/// The start of a BMP file: 14 bytes without gaps.
 struct BMPFileHeader
 {
     uint16_t type = 0;
@@ -21,12 +21,12 @@ struct BMPFileHeader
     uint32_t offset = 0; ///< of the pixels
 };
 
-/// The 40 bytes behind it, as they stand.
+/// The 40 bytes that follow, as stored.
 struct BMPInfoHeader
 {
-    uint32_t size = 0; ///< of this header; larger ones have more fields behind it
+    uint32_t size = 0; ///< of this header; larger ones have additional fields
     int32_t width = 0;
-    int32_t height = 0; ///< negative where rows stand from top to bottom
+    int32_t height = 0; ///< negative if rows are stored from top to bottom
     uint16_t planes = 0;
     uint16_t bitCount = 0;
     uint32_t compression = 0;
@@ -37,14 +37,14 @@ struct BMPInfoHeader
     uint32_t colorsImportant = 0;
 };
 
-/// A BMP file, read or written row by row. Uncompressed files of all depths are read, in both directions: a
-/// file that stands bottom up gives its bottom row as row 0, unless it comes as a stream, where row 0 is the
-/// top one. A stream that cannot go back returns its rows in file order only; the last row stays readable,
-/// whole or in pieces. Files are written with one channel or three, from the top row down.
+/// A BMP file, read or written row by row. Uncompressed files of all depths and both directions can be read:
+/// in a bottom-up file row 0 is the bottom row, except from a stream, where row 0 is the top. A stream
+/// without seeking returns rows in file order only; the last row can be read again, whole or in pieces. Files
+/// are written with one channel or three, top down.
 class CBMPPicture : public CPicture
 {
 public:
-    /// Null, with a message on standard error, for what cannot be read or written.
+    /// Opens a file; returns null, with a message on standard error, if it cannot be read or written.
     static CPicture* Open(const char* fileName, const char* mode);
     explicit CBMPPicture(std::string name) : CPicture(std::move(name)) {}
     ~CBMPPicture() override { CloseFile(); }
@@ -86,16 +86,16 @@ private:
     std::array<PixelRGBA, 256> m_kPalette{};
     bool m_bReading = false;
     bool m_bTopDown = false;
-    bool m_bFailed = false; // a write that the file system did not take
+    bool m_bFailed = false; // a write has failed
     int m_iWidth = 0;
     int m_iHeight = 0;
     int m_iChannels = 3;
-    int m_iRow = 0;               // the row that is written next
+    int m_iRow = 0;               // next row to write
     uint32_t m_uiRowSize = 0;     // bytes of a row in the file
-    int m_iHeldRow = -1;          // the file's row that m_kRow holds while reading, or -1
-    std::vector<uint8_t> m_kRow;  // the row at hand, as in the file
-    CPicInput m_kInput;           // of a picture that is read
-    std::FILE* m_pkOut = nullptr; // of one that is written
+    int m_iHeldRow = -1;          // the file row in m_kRow while reading, or -1
+    std::vector<uint8_t> m_kRow;  // current row, as in the file
+    CPicInput m_kInput;           // the picture being read
+    std::FILE* m_pkOut = nullptr; // the picture being written
 };
 
 } // namespace gw

@@ -1,5 +1,5 @@
-// Kernels of image scaling, one function a row. Each interval includes its left end and excludes its right
-// one, so that two samples at the same distance on both sides never count twice.
+// Kernels for scaling pictures, one function per row. Each interval includes its left end and excludes its
+// right end, so two samples at the same distance on both sides never count twice.
 
 #include "CFilter.h"
 
@@ -99,7 +99,7 @@ void InitMitchell(CFilter& filter, double b, double c)
     });
 }
 
-// The support alone ends it.
+// Only the support limits it.
 double Gaussian(double x, const void*)
 {
     return std::exp(-2.0 * x * x) * std::sqrt(2.0 / kPi);
@@ -174,8 +174,8 @@ const CFilter* FindFilter(std::string_view name)
     return found == std::end(kFilters) ? nullptr : found;
 }
 
-// The power series. Beyond what a double holds the sum is infinite and no term ever gets small; of a NaN no
-// comparison is true.
+// The power series. Beyond the range of a double the sum is infinite and no term gets small, and comparisons
+// with NaN are false; both end the loop.
 double BesselI0(double x)
 {
     constexpr double kSmallest = 1e-7;

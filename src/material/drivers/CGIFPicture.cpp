@@ -18,7 +18,7 @@ CPicture* CGIFPicture::Open(const char* fileName, const char* mode)
     return read ? picture.release() : nullptr;
 }
 
-// The image at hand stays where there is no other.
+// Keeps the current image if there is no next one.
 bool CGIFPicture::NextPicture()
 {
     GIFImage image;

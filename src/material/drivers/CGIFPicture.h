@@ -12,7 +12,7 @@ namespace gw {
 class CGIFPicture : public CPicture
 {
 public:
-    /// Null for what is no GIF file, and, with a message on standard error, for writing.
+    /// Opens a file; returns null if it is not a GIF file and, with a message on standard error, for writing.
     static CPicture* Open(const char* fileName, const char* mode);
     explicit CGIFPicture(std::string name) : CPicture(std::move(name)), m_kReader(m_kInput) {}
 
@@ -22,7 +22,7 @@ public:
     bool ReadRow(int y, int x, int count, uint8_t* pixels) override;
     bool ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels) override;
     bool NextPicture() override;
-    /// The image that rows are read from.
+    /// Returns the image that rows are read from.
     const GIFImage& Image() const { return m_kImage; }
 
 private:

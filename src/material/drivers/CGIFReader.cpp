@@ -1,3 +1,6 @@
+// Reads GIF files block by block. A file is a chain of extensions and images, each followed by sub-blocks of
+// up to 255 bytes; every step consumes bytes, so reading ends. Sizes are checked before pixels are allocated.
+
 #include "CGIFReader.h"
 
 #include "CLZWDecoder.h"
@@ -17,9 +20,10 @@ constexpr uint8_t kExtensionBlock = 0x21;
 constexpr uint8_t kControlLabel = 0xf9;
 constexpr uint8_t kHasPalette = 0x80;
 constexpr uint8_t kIsInterlaced = 0x40;
-constexpr size_t kMostPixels = size_t{1} << 25; // far beyond any screen, and a size that any machine has
+// far larger than any screen, but small enough for any machine
+constexpr size_t kMostPixels = size_t{1} << 25;
 
-// The rows of an interlaced image come in four passes.
+// Interlaced images store their rows in four passes.
 constexpr struct
 {
     size_t first;
@@ -66,7 +70,7 @@ bool CGIFReader::ReadHeader()
     return ReadPalette(screen[4], m_kPalette);
 }
 
-// A table of colours, where the flags tell of one.
+// Reads a color table if the flags announce one.
 bool CGIFReader::ReadPalette(uint8_t flags, Palette& palette)
 {
     if (!(flags & kHasPalette))
@@ -118,7 +122,7 @@ bool CGIFReader::ReadControl(Control& control)
     return true;
 }
 
-// A size and as many bytes; a size of 0 ends a chain of blocks.
+// Reads a size and that many bytes; size 0 ends a chain of blocks.
 bool CGIFReader::ReadBlock(uint8_t& size)
 {
     return input_.ReadValue(size) && input_.Read(std::as_writable_bytes(std::span(m_aBlock).first(size)));
@@ -151,8 +155,7 @@ bool CGIFReader::ReadDescriptor(const Control& control, GIFImage& image)
     return ReadPixels(place[8] & kIsInterlaced, image);
 }
 
-// Pixels that are missing are a failure. Blocks behind the last one are not needed, so that a file may end
-// there.
+// Missing pixels are a failure. Blocks after the last pixel are not needed, so a file can end there.
 bool CGIFReader::ReadPixels(bool isInterlaced, GIFImage& image)
 {
     const auto width = static_cast<size_t>(image.box.width);

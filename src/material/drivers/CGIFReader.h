@@ -12,33 +12,34 @@ namespace gw {
 
 class CPicInput;
 
-/// One image of a GIF file, with what an animation needs to know of it.
+/// One image of a GIF file, with its animation properties.
 struct GIFImage
 {
-    PictureBox box;                       ///< where it stands on the screen
+    PictureBox box;                       ///< position on the screen
     std::array<PixelRGBA, 256> palette{}; ///< the transparent entry has alpha 0, all others 255
     std::vector<uint8_t> pixels;          ///< indices into the palette, row by row from the top
     uint16_t delay = 0;                   ///< hundredths of a second
-    uint8_t disposal = 0;                 ///< what becomes of it before the next one
+    uint8_t disposal = 0;                 ///< what happens to it before the next one
 };
 
-/// Reads the images of a GIF87a or GIF89a file one after another. Every failure is final.
+/// Reads the images of a GIF87a or GIF89a file in order. After a failure, reading cannot continue.
 class CGIFReader
 {
 public:
     /// The input must outlive the reader.
     explicit CGIFReader(CPicInput& input) : input_(input) {}
 
-    /// Everything up to the first block. False for what is no GIF file.
+    /// Reads everything before the first block. Returns false if this is not a GIF file.
     bool ReadHeader();
-    /// The next image. False at the end of the file and for one that is damaged; the image is undefined then.
+    /// Reads the next image. Returns false at the end of the file or for a damaged image, which is then
+    /// undefined.
     bool ReadImage(GIFImage& image);
     int ScreenWidth() const { return m_iScreenWidth; }
     int ScreenHeight() const { return m_iScreenHeight; }
 
 private:
     using Palette = std::array<PixelRGBA, 256>;
-    /// What a control extension says of the next image.
+    /// The control extension of the next image.
     struct Control
     {
         uint16_t delay = 0;

@@ -38,8 +38,8 @@ bool CLZWDecoder::Decode(std::span<const uint8_t> bytes, std::vector<uint8_t>& p
     return true;
 }
 
-// The entry that a code makes consists of the string before it and the first pixel of its own; a code may be
-// that very entry.
+// A new entry consists of the previous string and the first pixel of the current one. The current code can
+// refer to that very entry.
 bool CLZWDecoder::Take(unsigned code, std::vector<uint8_t>& pixels)
 {
     if (code == m_uiClearCode)
@@ -60,7 +60,7 @@ bool CLZWDecoder::Take(unsigned code, std::vector<uint8_t>& pixels)
         Add(m_uiPrevious, m_kTable[isNext ? m_uiPrevious : code].first);
     Emit(code, pixels);
     m_uiPrevious = code;
-    // Also behind the first code, which makes no entry: of pixels of one bit it is the last one of two bits.
+    // Also after the first code, which adds no entry: for 1-bit pixels it is the last code of two bits.
     if (m_uiNextCode == 1u << m_uiCodeBits && m_uiCodeBits < kMostCodeBits)
         ++m_uiCodeBits;
     return true;
@@ -76,7 +76,7 @@ void CLZWDecoder::Add(unsigned prefix, uint8_t last)
     ++m_uiNextCode;
 }
 
-// From its last pixel to its first, as entries are chained.
+// Backwards, because entries are chained from the last pixel to the first.
 void CLZWDecoder::Emit(unsigned code, std::vector<uint8_t>& pixels) const
 {
     const size_t length = m_kTable[code].length;

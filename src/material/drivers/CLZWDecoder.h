@@ -8,16 +8,16 @@
 
 namespace gw {
 
-/// Decodes the codes of a GIF image, which stand low bits first and grow up to twelve bits. A table that is
-/// full stays as it is until a clear code comes.
+/// Decodes the codes of a GIF image, stored low bits first, up to twelve bits wide. A full table is kept
+/// until a clear code.
 class CLZWDecoder
 {
 public:
-    /// The width of a pixel in bits, from 1 to 8.
+    /// `pixelBits` is the width of a pixel, 1 to 8.
     explicit CLZWDecoder(unsigned pixelBits);
 
-    /// Appends the pixels of some more bytes, up to a count of all pixels. False for a code that cannot stand
-    /// here. What comes behind the end code or the last pixel is passed over.
+    /// Decodes more bytes and appends pixels, up to a total count. Returns false for an invalid code. Ignores
+    /// everything after the end code or the last pixel.
     bool Decode(std::span<const uint8_t> bytes, std::vector<uint8_t>& pixels, size_t pixelCount);
 
 private:
@@ -30,7 +30,7 @@ private:
     void Add(unsigned prefix, uint8_t last);
     void Emit(unsigned code, std::vector<uint8_t>& pixels) const;
 
-    /// A string of pixels: another one and a last pixel.
+    /// A string of pixels: another string plus a last pixel.
     struct Entry
     {
         uint16_t prefix;
@@ -41,11 +41,11 @@ private:
 
     std::array<Entry, kTableSize> m_kTable{};
     unsigned m_uiClearCode;
-    unsigned m_uiNextCode = 0; // the entry that is made next
+    unsigned m_uiNextCode = 0; // next entry to be added
     unsigned m_uiCodeBits = 0;
     unsigned m_uiPrevious = kNoCode;
     unsigned m_uiPixelBits;
-    uint32_t m_uiBits = 0; // read and not yet taken, the next ones low
+    uint32_t m_uiBits = 0; // read but not yet used, next ones in the low bits
     unsigned m_uiBitCount = 0;
     bool m_bEnded = false;
 };

@@ -7,7 +7,7 @@
 
 namespace gw {
 
-/// A pixel of four bytes, in memory red first.
+/// A pixel of four bytes, red first in memory.
 struct PixelRGBA
 {
     uint8_t r;
@@ -18,13 +18,13 @@ struct PixelRGBA
     friend bool operator==(const PixelRGBA&, const PixelRGBA&) = default;
 };
 
-/// The brightness of a pixel, for pictures of one channel.
+/// Returns the brightness of a pixel, for single-channel pictures.
 inline uint8_t Brightness(const PixelRGBA& pixel)
 {
     return static_cast<uint8_t>((77 * pixel.r + 150 * pixel.g + 29 * pixel.b) >> 8);
 }
 
-/// Where a picture has pixels: columns from x on, rows from y on.
+/// The area of a picture: columns starting at x, rows starting at y.
 struct PictureBox
 {
     int x = 0;
@@ -33,9 +33,9 @@ struct PictureBox
     int height = 0;
 };
 
-/// A picture file that is open, read or written row by row. Rows are counts of pixels from a first column on;
-/// a row that is not inside the box, or that this picture cannot do, answers false and leaves the buffer
-/// alone. A single channel is the palette's index where there is a palette, else the brightness.
+/// An open picture file, read or written row by row. A row is a number of pixels starting at a column. If it
+/// is not inside the box, or not supported, the call returns false and leaves the buffer unchanged. A single
+/// channel is the palette index if there is a palette, otherwise the brightness.
 class CPicture
 {
 public:
@@ -45,18 +45,18 @@ public:
     CPicture& operator=(const CPicture&) = delete;
 
     const std::string& Name() const { return m_kName; }
-    /// What messages of this picture's driver begin with.
+    /// Returns the prefix of this driver's messages.
     virtual const char* MessageName() const = 0;
-    /// Ends writing; false where not all rows have come or not all bytes could be written.
+    /// Ends writing. Returns false if rows are missing or bytes could not be written.
     virtual bool Close() { return true; }
 
     virtual int ChannelCount() const = 0;
     virtual PictureBox Box() const = 0;
-    /// Whether row 0 is the bottom of the picture.
+    /// Returns whether row 0 is the bottom row.
     virtual bool IsBottomFirst() const { return false; }
     virtual bool ReadRow(int y, int x, int count, uint8_t* pixels) = 0;
     virtual bool ReadRowRGBA(int y, int x, int count, PixelRGBA* pixels) = 0;
-    /// Goes on to the next picture in the file; false where there is none.
+    /// Moves to the next picture in the file; false if there is none.
     virtual bool NextPicture() { return false; }
 
     virtual bool SetChannelCount(int) { return false; }
@@ -65,7 +65,7 @@ public:
     virtual bool WriteRowRGBA(int, int, int, const PixelRGBA*) { return false; }
 
 protected:
-    /// Whether a row's pixels lie inside a picture of this size.
+    /// Returns whether a row's pixels are inside a picture of this size.
     static bool IsInside(int y, int x, int count, const PictureBox& box)
     {
         return y >= 0 && y < box.height && x >= 0 && count >= 0 && x <= box.width - count;
@@ -75,9 +75,9 @@ private:
     std::string m_kName;
 };
 
-/// Opens a picture by the driver of its file type. The mode begins with "r" or "w"; "-.bmp" and "-.gif" are
-/// the standard streams. Null where there is no driver or the driver refuses, which it tells on standard
-/// error.
+/// Opens a picture with the driver of its file type. The mode starts with "r" or "w"; "-.bmp" and "-.gif" are
+/// the standard streams. Returns null without a driver or, with a message on standard error, if the driver
+/// refuses.
 std::unique_ptr<CPicture> OpenPicture(const std::string& fileName, const char* mode);
 
 } // namespace gw

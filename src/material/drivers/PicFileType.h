@@ -8,25 +8,24 @@
 
 namespace gw {
 
-/// A kind of picture files: the driver that reads it, if there is one, an extension, and the number that such
-/// files begin with.
+/// A picture file type: its driver, if any, its extension, and the number at the start of its files.
 struct PicFileType
 {
     std::string_view driver;
-    std::string_view extension; ///< without its dot
-    uint16_t magic;             ///< the first byte is the high one
-    bool magicOffset;           ///< the number stands one byte further on
-    uint8_t magicSize;          ///< bytes of the number, 0 for none
+    std::string_view extension; ///< without the dot
+    uint16_t magic;             ///< first byte is the high byte
+    bool magicOffset;           ///< the number is one byte later
+    uint8_t magicSize;          ///< size in bytes, 0 without one
 };
 
-/// All known kinds, also those without a driver.
+/// Returns all known types, including those without a driver.
 std::span<const PicFileType> PictureTypes();
-/// The kind of a file name by its extension: as it stands, since "Z" and "z" differ, then without regard to
-/// case. Null for an unknown one.
+/// Returns the type of a file name by extension: exact case first, since "Z" and "z" differ, then ignoring
+/// case. Null if unknown.
 const PicFileType* FindPictureType(std::string_view fileName);
-/// The kind by the bytes that a file begins with, or null.
+/// Returns the type by the first bytes of a file, or null.
 const PicFileType* FindPictureTypeOfBytes(std::span<const std::byte> bytes);
-/// The same for a regular file.
+/// Same for a regular file.
 const PicFileType* FindPictureTypeOfFile(const std::string& fileName);
 
 } // namespace gw

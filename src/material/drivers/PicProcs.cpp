@@ -24,7 +24,7 @@ void TellUnsupported(const CPicture* picture, const char* operation)
     std::fprintf(stderr, "?%s_%s\n", picture->MessageName(), operation);
 }
 
-// All drivers have the same operations on a picture: what differs is the picture's class.
+// All drivers have the same operations; only the class of the picture differs.
 constexpr PicProcs ProcsOf(const char* name, CPicture* (*open)(const char* fileName, const char* mode))
 {
     return {

@@ -8,9 +8,8 @@
 
 namespace gw {
 
-/// A rotation that grows axis by axis, for the inner loops of the readers. Each step changes two rows only, a
-/// third of a matrix product; rows are padded to four floats, so that a step takes a handful of vector
-/// instructions.
+/// A rotation built up axis by axis, for the inner loops of the readers. Each step changes only two rows, a
+/// third of a matrix product. Rows are padded to four floats, so a step takes only a few vector instructions.
 class CAxisRotation
 {
 public:
@@ -21,8 +20,8 @@ public:
             m_kRows[row] = {m.m[3 * row], m.m[3 * row + 1], m.m[3 * row + 2], 0.0f};
     }
 
-    /// M := R · M for the rotation R about one axis (0 X, 1 Y, 2 Z) by an angle in radians. The result is
-    /// that of Mat3FromAxisAngle and Mat3Multiply within rounding.
+    /// M := R · M, where R is the rotation about one axis (0 X, 1 Y, 2 Z) by an angle in radians. Same result
+    /// as Mat3FromAxisAngle and Mat3Multiply, within rounding.
     void RotateRows(size_t axis, float radians)
     {
         const float c = std::cos(radians);

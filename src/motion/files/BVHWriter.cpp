@@ -1,4 +1,6 @@
-// The writing half of TKBVHStream.
+// The writing half of TKBVHStream. It has two modes. The default one reproduces files as they have always
+// been written, with their losses: the last frame is missing and bone ends follow the mesh. The exact one is
+// for readers that need the motion itself.
 
 #include "BoneMeshQueries.h"
 #include "CGeometry.h"
@@ -15,7 +17,7 @@
 
 namespace gw {
 
-/// What tells the two ways of writing apart.
+/// The differences between the two modes of writing.
 struct BVHWriteRules
 {
     int frameCount;
@@ -24,18 +26,18 @@ struct BVHWriteRules
 
 namespace {
 
-constexpr float kFrameLimit = 1 << 24; // frame numbers beyond are no whole floats
+constexpr float kFrameLimit = 1 << 24; // larger frame numbers are not exact floats
 constexpr std::string_view kIndent = "    ";
 constexpr std::string_view kKindNames[] = {"Global", "ROOT", "JOINT", "End"};
 
-/// A node and what the hierarchy says of it.
+/// A node and its block in the hierarchy.
 struct Bone
 {
     const CNode* node;
     const TKBVHJoint* joint;
 };
 
-// Where the end of the bone's mesh's X axis stands, seen from the node.
+// Returns the end of the bone mesh's X axis, relative to the node.
 Vec3 EndOffset(CNode& node)
 {
     const CObject* found = node.FindObject(node.GetName(), &CGeometry::ms_kRTTI, true);
@@ -43,7 +45,7 @@ Vec3 EndOffset(CNode& node)
     return TransformCoord(kVec3UnitX, world) - node.m_kWorldMatrix.Translation();
 }
 
-// Whether a joint's positions are anything but its offset in every frame.
+// Returns whether a joint's positions differ from its offset in any frame.
 bool MovesAgainstParent(const CNode& node)
 {
     const CKeyframeControl* track = RecordCast<CKeyframeControl>(node.GetControl());
@@ -52,7 +54,7 @@ bool MovesAgainstParent(const CNode& node)
                                         [&](const Vec3& key) { return key != rest; });
 }
 
-// Takes a tree in rest pose. Bones are collected in the order of the rows.
+// Collects bones from a tree in rest pose, in row order.
 void CollectBones(CNode& node, TKBVHJoint& joint, const Vec3& parentPosition, bool exact,
                   std::vector<Bone>& bones)
 {

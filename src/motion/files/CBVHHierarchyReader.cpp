@@ -1,3 +1,7 @@
+// Reads the joint blocks of a BVH file by recursive descent. Real files vary: braces share a line with a
+// name, keywords are unknown, blocks are not closed. Unknown lines are skipped, and recursion is limited by
+// the nesting limit of the scene tree that will be built.
+
 #include "CBVHHierarchyReader.h"
 
 #include "CGraphCheck.h"
@@ -15,7 +19,7 @@ namespace gw {
 
 namespace {
 
-// A finite number, or None and Unusual for what is none.
+// Reads a finite number; kind is None or Unusual if there is none.
 float TakeNumber(std::string_view& rest, std::string_view& token, ENumber& kind)
 {
     token = NextToken(rest);
@@ -61,7 +65,7 @@ bool CBVHHierarchyReader::Read()
     return Fail(EFailure::MissingSection, "MOTION");
 }
 
-// A joint outside all blocks belongs to the first root.
+// A joint outside all blocks is attached to the first root.
 bool CBVHHierarchyReader::ReadTopJoint(std::string_view rest)
 {
     TKBVHJoint* const root = file_.FirstRoot();
@@ -74,7 +78,7 @@ bool CBVHHierarchyReader::ReadJoint(TKBVHJoint& joint, std::string_view rest, si
 {
     if (!ReadName(joint, rest))
         return false;
-    // A bone mesh nests one level deeper than its joint.
+    // A bone mesh is nested one level deeper than its joint.
     if (depth >= kNestingLimit)
         return Fail(EFailure::TooDeep, joint.name);
     if (++file_.jointCount > kBoneLimit)
@@ -88,14 +92,14 @@ bool CBVHHierarchyReader::ReadName(TKBVHJoint& joint, std::string_view rest)
     joint.name = NextToken(rest);
     if (!MayBeName(joint.name) || (joint.name.empty() && joint.kind != EJointKind::EndSite))
         return Fail(EFailure::BadName, joint.name);
-    // A brace that stands here is missed below, which is worth more words than a name of two.
+    // A brace here will be reported as missing below, which says more than a warning about a two-word name.
     const std::string_view more = NextToken(rest);
     if (!more.empty() && more != "{")
         record_.Warn(EFailure::CutName, lines_.LineNumber(), joint.name);
     return true;
 }
 
-// A file that ends inside a block is found out by the caller, who looks for "MOTION" then.
+// If the file ends inside a block, the caller notices when it looks for "MOTION".
 bool CBVHHierarchyReader::ReadBody(TKBVHJoint& joint, size_t depth)
 {
     bool open = false;

@@ -11,8 +11,8 @@ class CTextLines;
 struct TKBVHFile;
 struct TKBVHJoint;
 
-/// Reads the hierarchy of a BVH file, from behind the line "HIERARCHY" up to the line "MOTION". The first
-/// word of a line decides what it is; lines that mean nothing are skipped.
+/// Reads the hierarchy of a BVH file, from after the line "HIERARCHY" to the line "MOTION". The first word of
+/// a line determines its meaning; unknown lines are skipped.
 class CBVHHierarchyReader
 {
 public:
@@ -21,8 +21,8 @@ public:
     {
     }
 
-    /// Replaces the file's records. Leaves the cursor before "MOTION". False, with the reason in the record,
-    /// where that never comes or a block is no good.
+    /// Replaces the file's records and leaves the cursor before "MOTION". Returns false, with the reason in
+    /// the record, if that line is missing or a block is invalid.
     bool Read();
 
 private:
@@ -38,7 +38,7 @@ private:
     CTextLines& lines_;
     TKBVHFile& file_;
     CFailureRecord& record_;
-    size_t m_uiSwallowedMotion = 0; // a line "MOTION" inside a block that is not closed
+    size_t m_uiSwallowedMotion = 0; // line of a "MOTION" inside an unclosed block
 };
 
 } // namespace gw

@@ -1,7 +1,11 @@
-// Nearly all of a BVH file is its motion rows, so this is where loading takes its time. A row is read by one
-// cursor into a small array of numbers, which then become a key for each joint at once: no text is copied, no
-// value is kept, and the keys are where the track will have them. Key arrays are reserved once, but never
-// beyond what the file's bytes can fill: a count in a file is a claim.
+// Motion rows are nearly all of a BVH file, so loading spends its time here. A cursor reads one row into a
+// small array of numbers, which immediately become one key per joint: no text is copied, and keys are stored
+// directly in their track arrays. The arrays are reserved once, but never for more keys than the file's bytes
+// can hold, because the count in the file is only a claim.
+//
+// Some exporters write short rows, or repeat each joint's offset in its position channels. A joint whose
+// values are missing takes them from its own columns of the next row, as readers have always done; repeated
+// offsets are detected in the first rows and reported.
 
 #include "CBVHRowReader.h"
 
@@ -20,7 +24,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kBytesPerValue = 2;      // a digit and a separator
-constexpr int kProbeRows = 8;             // rows that may tell that positions repeat the offsets
+constexpr int kProbeRows = 8;             // rows in which repeated offsets are searched
 constexpr double kRepeatTolerance = 0.01; // of an offset's length
 
 bool IsSeparator(char c)
@@ -57,7 +61,7 @@ void AppendKey(TKBVHJoint& joint, const float* values)
     joint.positionKeys.push_back(position);
 }
 
-// Whether the position channels of a joint say its offset over again. False for one without an offset.
+// Returns whether a joint's position channels repeat its offset. False for a joint without an offset.
 bool RepeatsOffset(const TKBVHJoint& joint, const float* values)
 {
     Vec3 position = kVec3Zero;
@@ -80,7 +84,7 @@ bool HasPositions(const TKBVHJoint& joint)
 CBVHRowReader::CBVHRowReader(TKBVHJoint& root, CFailureRecord& record)
     : record_(record), m_uiRootValues(std::max<size_t>(root.channels.size(), 1)), m_iProbes(kProbeRows)
 {
-    // The root takes a value also where it has no channels.
+    // The root takes a value even without channels.
     if (root.channels.empty())
         m_kRow.resize(1);
     AddColumns(root);
@@ -102,8 +106,8 @@ bool CBVHRowReader::RowsFit(size_t frameCount, size_t byteCount) const
 
 void CBVHRowReader::ReserveKeys(size_t frameCount, size_t byteCount)
 {
-    // Where rows will be short the arrays grow with what there is, and so they do for the rows of a second
-    // motion: each exact reservation is a copy.
+    // If rows will be short, the arrays grow as needed, and so they do for the rows of a second motion: each
+    // exact reservation copies them.
     if (frameCount > (byteCount + 1) / (kBytesPerValue * m_kRow.size()))
         return;
     for (const Column& column : m_kColumns)
@@ -167,8 +171,8 @@ bool CBVHRowReader::ReadValues(std::string_view row)
     return true;
 }
 
-// A token that is no plain number: read as far as it goes, or refused. Root values are read like atof, which
-// takes what sscanf gives up on.
+// Handles a token that is not a plain number: reads as much as possible, or refuses it. Root values are read
+// like atof, which accepts some texts that sscanf rejects.
 bool CBVHRowReader::JudgeToken(std::string_view token, size_t index)
 {
     ENumber kind;
@@ -209,7 +213,8 @@ void CBVHRowReader::AppendKeys()
     }
 }
 
-// After a short row a joint's values are out of step with the rows: a key is made whenever enough have come.
+// After a short row, a joint's values are out of step with the rows: a key is added whenever enough values
+// have arrived.
 void CBVHRowReader::AppendLate(Column& column)
 {
     const size_t count = column.joint->channels.size();
@@ -224,7 +229,7 @@ void CBVHRowReader::AppendLate(Column& column)
     column.pending.erase(column.pending.begin(), column.pending.begin() + static_cast<ptrdiff_t>(count));
 }
 
-// Values that do not fill a key make one all the same; those that are missing count as 0.
+// Completes a partial last key, with 0 for missing values.
 void CBVHRowReader::FillLastKeys()
 {
     for (Column& column : m_kColumns)

@@ -11,27 +11,27 @@ namespace gw {
 class CTextLines;
 struct TKBVHJoint;
 
-/// Turns the motion rows of a BVH file into keys of its joints, row by row. Values stand in the order of the
-/// hierarchy, depth first, as many for each joint as it has channels.
+/// Converts the motion rows of a BVH file to keys of its joints, row by row. Values are in hierarchy order,
+/// depth first, one per channel of each joint.
 class CBVHRowReader
 {
 public:
-    /// Plans the columns under a root joint.
+    /// Plans the columns of all joints under a root.
     CBVHRowReader(TKBVHJoint& root, CFailureRecord& record);
 
-    /// Reads that many rows. False where the text ends before, and, with the reason in the record, for a row
-    /// that is too short for the root or holds anything but finite numbers. Where a row is short for other
-    /// joints, their later values move up.
+    /// Reads that many rows. Returns false if the text ends early or, with the reason in the record, if a row
+    /// is too short for the root or contains anything but finite numbers. If a row is too short for other
+    /// joints, the following values move up.
     bool ReadRows(CTextLines& lines, size_t frameCount);
-    /// Whether that many rows can stand in that many bytes.
+    /// Returns whether that many rows fit into that many bytes.
     bool RowsFit(size_t frameCount, size_t byteCount) const;
 
 private:
     struct Column
     {
         TKBVHJoint* joint;
-        size_t first;               // index of the first value in a row
-        std::vector<float> pending; // values that came late and do not fill a key yet
+        size_t first;               // index of its first value in a row
+        std::vector<float> pending; // late values that do not yet fill a key
     };
 
     void AddColumns(TKBVHJoint& joint);
@@ -47,9 +47,9 @@ private:
 
     CFailureRecord& record_;
     std::vector<Column> m_kColumns;
-    std::vector<float> m_kRow; // the values of one row
-    size_t m_uiValues = 0;     // how many of them the row at hand had
-    size_t m_uiRootValues;     // how many it must have
+    std::vector<float> m_kRow; // values of the current row
+    size_t m_uiValues = 0;     // number of values that the row had
+    size_t m_uiRootValues;     // number of values that a row must have
     size_t m_uiLine = 0;
     int m_iProbes;
 };

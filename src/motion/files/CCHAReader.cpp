@@ -1,3 +1,8 @@
+// Reads CHA files. The format is line based and its readers have always been lenient, which this one
+// preserves: a line starting below "?" is a remark (as a signed character, so any non-ASCII letter too), an
+// empty line ends the header, headers can be nested, and a row with too few numbers repeats the previous
+// frame's values. All counts in the header are limited by what the remaining bytes can hold.
+
 #include "CCHAReader.h"
 
 #include "CTextLines.h"
@@ -13,7 +18,7 @@ namespace gw {
 
 namespace {
 
-constexpr signed char kFirstOfNames = '?'; // in sections, lines that begin with less are remarks
+constexpr signed char kFirstOfNames = '?'; // section lines starting with a lower character are remarks
 constexpr size_t kBytesPerRow = 2;         // a name and a line feed
 
 struct KeyRow
@@ -30,7 +35,7 @@ constexpr KeyRow kKeys[] = {
     {"NumSegments",   &TKCHFile::numSegments  },
 };
 
-// The character is signed: names that begin with a letter of another alphabet are remarks too.
+// The character is signed, so names starting with a non-ASCII letter are remarks too.
 bool IsRemark(std::string_view line)
 {
     return line.empty() || static_cast<signed char>(line[0]) < kFirstOfNames;
@@ -73,7 +78,7 @@ bool CCHAReader::Read()
         else if (!ReadWord(word, rest))
             return false;
     }
-    // The end of the file closes a header too, but only after the motion has been read without a frame.
+    // The end of the file also closes a header, but by then the motion has been read with 0 frames.
     if (m_uiOpenHeaders > 0)
         CloseHeader();
     return CheckFile(EFailure::MissingSection);
@@ -88,7 +93,7 @@ bool CCHAReader::ReadWord(std::string_view word, std::string_view rest)
     return key == std::end(kKeys) || ReadKey(word, file_.*key->field, rest);
 }
 
-// A key without a value is as good as a missing one: its field keeps the default.
+// A key without a value keeps its default, like a missing key.
 bool CCHAReader::ReadKey(std::string_view key, int& field, std::string_view rest)
 {
     const std::string_view token = NextToken(rest);
@@ -116,7 +121,8 @@ void CCHAReader::CloseHeader()
     file_.CountFrames();
 }
 
-// The next line that is no remark. False, with the cursor before it, where a section begins.
+// Reads the next line that is not a remark. At the start of a section, returns false with the cursor before
+// it.
 bool CCHAReader::NextSectionLine(std::string_view& line)
 {
     while (lines_.Next(line))
@@ -174,7 +180,7 @@ bool CCHAReader::ReadHierarchy()
     return true;
 }
 
-// Lines behind those that the header counts hang nowhere, so they need not be kept.
+// Segments beyond the header's count are never attached, so they are not kept.
 bool CCHAReader::AddSegment(std::string_view line, bool& counts)
 {
     const std::string_view name = NextWord(line);
@@ -215,7 +221,7 @@ std::span<CCHAReader::Place> CCHAReader::CountedPlaces()
     return std::span(m_kPlaces).first(static_cast<size_t>(std::max(file_.numSegments, 0)));
 }
 
-// Makes room for the frames. False where the bytes that remain cannot hold as many rows.
+// Reserves the frames; false if the remaining bytes cannot hold that many rows.
 bool CCHAReader::ReservePlaces()
 {
     const auto frames = static_cast<size_t>(file_.frameCount);
@@ -246,8 +252,7 @@ bool CCHAReader::ReadRow(size_t index, std::string_view line)
     const bool counts = index < CountedPlaces().size();
     if (counts && count < place.row.size())
         Warn(EFailure::ShortRow, name);
-    // A row without values does not rename its segment: in a file that was cut off, half a name may be the
-    // last thing there is.
+    // A row without values does not rename its segment: in a truncated file, the last row can be half a name.
     if (count > 0 || place.rowCount == 0)
         place.segment.name = name;
     const auto begin = static_cast<size_t>(file_.beginFrame);
@@ -260,8 +265,8 @@ bool CCHAReader::ReadRow(size_t index, std::string_view line)
     return true;
 }
 
-// As sscanf takes numbers with a comma behind each: blanks may stand before a number, not before the comma.
-// Where one is missing the others stay as they were.
+// Reads numbers as sscanf does, each followed by a comma: blanks are allowed before a number, but not before
+// a comma. If one is missing, the rest keep their values.
 bool CCHAReader::ReadNumbers(std::string_view text, Row& row, size_t& count)
 {
     for (count = 0; count < row.size(); ++count)
@@ -282,7 +287,7 @@ bool CCHAReader::ReadNumbers(std::string_view text, Row& row, size_t& count)
     return true;
 }
 
-// Hands the frames over to the records that the rows name: of equal names the first row's.
+// Moves the frames to the records named by the rows; if a name occurs twice, the first row's frames are used.
 bool CCHAReader::TakeFrames()
 {
     for (Place& place : CountedPlaces())

@@ -13,9 +13,9 @@ namespace gw {
 
 class CTextLines;
 
-/// Reads a CHA file into records. The first word of a line says what it is; a line without a word closes the
-/// header or, outside it, ends the file. Inside the other sections a line counts only where it begins with a
-/// character from "?" on.
+/// Reads a CHA file into records. The first word of a line determines its meaning; a line without a word
+/// closes the header or, outside it, ends the file. In the other sections, only lines that start with a
+/// character from "?" on are read.
 class CCHAReader
 {
 public:
@@ -24,8 +24,8 @@ public:
     {
     }
 
-    /// Reads all lines. False, with the reason in the record, for a section that is no good and for a file
-    /// without a root segment or without a motion.
+    /// Reads all lines. Returns false, with the reason in the record, for an invalid section and for a file
+    /// without a root segment or a motion.
     bool Read();
 
 private:
@@ -37,14 +37,14 @@ private:
     };
     static const HandlerRow kHandlers[];
 
-    /// The numbers of a row: the matrix row by row, then the position.
+    /// A row's numbers: the matrix row by row, then the position.
     using Row = std::array<float, 12>;
-    /// An entry of the work array: the rows that stand at one place of every frame.
+    /// An entry of the work array: the rows at one position of every frame.
     struct Place
     {
         TKCHSegment segment;
         size_t rowCount = 0;
-        Row row{}; // the last one, which fills up a row that is short
+        Row row{}; // the last row, which completes a short one
     };
 
     bool ReadWord(std::string_view word, std::string_view rest);
@@ -72,7 +72,7 @@ private:
     CTextLines& lines_;
     TKCHFile& file_;
     CFailureRecord& record_;
-    size_t m_uiOpenHeaders = 0; // a header may stand in a header, and each takes a blank line of its own
+    size_t m_uiOpenHeaders = 0; // headers can be nested, and each is closed by its own blank line
     bool m_bHasMotion = false;
     std::vector<Place> m_kPlaces;
 };

@@ -1,3 +1,7 @@
+// Reads HTR files. A file has a header, a hierarchy of names, a base pose, and one section of rows per
+// segment. Sections are found by name through a table of functions. Files name segments twice, in cycles or
+// not at all; such segments are left out with a warning instead of failing the file.
+
 #include "CHTRReader.h"
 
 #include "CGraphCheck.h"
@@ -16,7 +20,7 @@ namespace gw {
 
 namespace {
 
-constexpr std::string_view kEndSection = "[EndOfFile]"; // closes files of other programs
+constexpr std::string_view kEndSection = "[EndOfFile]"; // ends files of other programs
 
 bool TakeValue(std::string_view token, TKHTRFile& file, const HTRText& field)
 {
@@ -80,8 +84,8 @@ bool CHTRReader::ReadSection(std::string_view section)
     return true;
 }
 
-// The next line that is neither empty nor a comment. False, with the cursor before it, where a section
-// begins.
+// Reads the next line that is neither empty nor a comment. At the start of a section, returns false with the
+// cursor before it.
 bool CHTRReader::NextSectionLine(std::string_view& line)
 {
     while (lines_.Next(line))
@@ -114,7 +118,7 @@ bool CHTRReader::ReadHeader(std::string_view)
     return true;
 }
 
-// A key without a value is as good as a missing one: its field keeps the default.
+// A key without a value keeps its default, like a missing key.
 bool CHTRReader::ReadKey(std::string_view key, std::string_view rest)
 {
     const auto known = std::ranges::find(kHTRKeys, key, &HTRKey::name);
@@ -162,8 +166,8 @@ bool CHTRReader::AddSegment(std::string_view line)
     return true;
 }
 
-// Hangs the segments under their parents, as many as the header counts. Of two equal names the first one is
-// meant. Segments that name each other in a ring hang on nothing and are never found again.
+// Attaches the segments to their parents, as many as the header counts. Of two equal names, the first is
+// used. Segments that form a cycle are attached to nothing and never reached.
 void CHTRReader::LinkSegments()
 {
     std::unordered_map<std::string_view, TKHTRSegment*> segmentOfName{
@@ -189,7 +193,7 @@ void CHTRReader::LinkSegments()
         record_.Warn(EFailure::BadCount, file_.segments[counted + 1]->line, "NumSegments");
 }
 
-// Depth first, so that a name means the segment that a search from the root finds.
+// Depth first, so a name refers to the same segment as a search from the root.
 bool CHTRReader::IndexSegments()
 {
     std::vector<std::pair<TKHTRSegment*, size_t>> waiting{
@@ -199,7 +203,7 @@ bool CHTRReader::IndexSegments()
     {
         const auto [segment, depth] = waiting.back();
         waiting.pop_back();
-        // A bone mesh nests one level deeper than its segment.
+        // A bone mesh is nested one level deeper than its segment.
         if (depth >= kNestingLimit)
             return record_.Fail(EFailure::TooDeep, segment->line, segment->name);
         if (depth > 0)

@@ -14,9 +14,9 @@ class CTextLines;
 struct TKHTRFile;
 struct TKHTRSegment;
 
-/// Reads an HTR file into records. A line that begins with "[" starts a section; sections come in any order,
-/// but the header's count of segments says how many lines of the hierarchy count, and values of a segment
-/// that is not there yet are lost. Unknown sections are skipped.
+/// Reads an HTR file into records. A line starting with "[" starts a section. Sections come in any order, but
+/// the header's segment count limits the hierarchy lines, and values of a segment that is not yet known are
+/// lost. Unknown sections are skipped.
 class CHTRReader
 {
 public:
@@ -25,8 +25,8 @@ public:
     {
     }
 
-    /// Reads all lines. False, with the reason in the record, for a section that is no good, for a file
-    /// without a hierarchy and for one that asks for more frames than its size justifies.
+    /// Reads all lines. Returns false, with the reason in the record, for an invalid section, a file without
+    /// a hierarchy, or more frames than its size justifies.
     bool Read();
 
 private:
@@ -62,8 +62,8 @@ private:
     CTextLines& lines_;
     TKHTRFile& file_;
     CFailureRecord& record_;
-    std::set<std::string, std::less<>> m_kSegmentSections; // "[name]" of each segment that has a parent
-    size_t m_uiFramesLine = 0;                             // of the key "NumFrames"
+    std::set<std::string, std::less<>> m_kSegmentSections; // "[name]" of each segment with a parent
+    size_t m_uiFramesLine = 0;                             // line of the key "NumFrames"
 };
 
 } // namespace gw

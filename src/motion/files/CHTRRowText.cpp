@@ -34,7 +34,7 @@ char* WriteColumns(char* out, const Vec3& v)
 
 } // namespace
 
-// Where the text after the translation begins.
+// Returns where the text after the translation starts.
 char* CHTRRowText::WriteTranslation(const Vec3& translation)
 {
     if (!m_bHasLast || !IsSame(translation, m_kLast.translation))

@@ -9,7 +9,7 @@ namespace gw {
 
 class CLineWriter;
 
-/// One row of a segment in a file: what a node's pose is relative to its base pose.
+/// One row of a segment in a file: a node's pose relative to its base pose.
 struct HTRRow
 {
     Vec3 translation = kVec3Zero;
@@ -17,14 +17,14 @@ struct HTRRow
     float scale = 1.0f;
 };
 
-/// Writes the rows of one segment after another. Columns that stay as they were in the row before, which is
-/// nearly always so for four of the seven, are copied and not formatted again.
+/// Writes the rows of one segment. Columns equal to the previous row's, usually four of the seven, are copied
+/// instead of formatted again.
 class CHTRRowText
 {
 public:
-    /// "number Tx Ty Tz Rx Ry Rz SF" as a line. A value that is not finite is written as 0.
+    /// Writes "number Tx Ty Tz Rx Ry Rz SF" as a line. A value that is not finite becomes 0.
     void Write(CLineWriter& out, int number, const HTRRow& row);
-    /// The last row once more, under another number.
+    /// Writes the last row again with another number.
     void Repeat(CLineWriter& out, int number) const;
 
 private:
@@ -35,8 +35,8 @@ private:
 
     HTRRow m_kLast;
     bool m_bHasLast = false;
-    // The last row from the blank after its number to its line end, and the lengths of its first part and its
-    // last.
+    // The last row from the blank after its number to its line end, and the lengths of its first and last
+    // parts.
     char m_acText[kColumns * (1 + kFixed6Bytes) + 2];
     char m_acScale[1 + kFixed6Bytes + 2];
     size_t m_uiText = 0;

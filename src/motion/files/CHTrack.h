@@ -7,8 +7,8 @@ class CNode;
 struct TKCHFile;
 struct TKCHSegment;
 
-/// Gives a node the name of its segment and a track of its frames, which leave the segment. The rest pose is
-/// the first position, unturned.
+/// Gives a node its segment's name and a track with its frames, which are moved out of the segment. The rest
+/// pose is the first position, without rotation.
 CKeyframeControl& AttachCHTrack(CNode& node, const TKCHFile& file, TKCHSegment& segment, float frequency);
 
 } // namespace gw

@@ -17,39 +17,37 @@ inline constexpr std::string_view kTextLineEnd =
     "\n";
 #endif
 
-/// Lines of text on their way into a sink. The text goes out in pieces, so that it is never in memory as a
-/// whole.
+/// Writes lines of text to a sink in pieces, so the whole text is never in memory.
 class CLineWriter
 {
 public:
     explicit CLineWriter(CByteSink sink) : m_kSink(std::move(sink)) {}
 
-    // Parts of a line, in the order of the calls; EndLine ends it with the platform's line end.
+    // Parts of a line, in call order; EndLine ends it with the platform's line end.
     CLineWriter& Text(std::string_view text);
-    /// As "%d".
+    /// Formats like "%d".
     CLineWriter& Int(int32_t value);
-    /// As "%f". What is no finite number is written as 0: no reader takes anything else back.
+    /// Formats like "%f". A number that is not finite becomes 0, because readers accept nothing else.
     CLineWriter& Number(float value);
-    /// In as many decimals as it takes to read the same number back.
+    /// Formats with as many decimals as needed to read back the same number.
     CLineWriter& Shortest(float value);
     void EndLine();
     void Line(std::string_view text);
 
-    /// For rows that are formatted in one go: where that many bytes can be written. Taken says where they
-    /// end.
+    /// Returns memory for that many bytes, for rows that are formatted in one step. Taken sets their end.
     char* Room(size_t byteCount)
     {
         return m_kBuffer.size() - m_uiUsed >= byteCount ? m_kBuffer.data() + m_uiUsed : MakeRoom(byteCount);
     }
     void Taken(const char* end) { m_uiUsed = static_cast<size_t>(end - m_kBuffer.data()); }
 
-    /// Hands on what is left. False when the sink refused anything since the start.
+    /// Flushes the rest. Returns false if the sink has failed since the start.
     bool Flush();
 
 private:
     char* MakeRoom(size_t byteCount);
 
-    static constexpr size_t kPieceBytes = size_t{1} << 16; // stays in the cache of a core
+    static constexpr size_t kPieceBytes = size_t{1} << 16; // fits into a core's cache
 
     CByteSink m_kSink;
     std::string m_kBuffer = std::string(kPieceBytes, '\0');

@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-// Whether a control poses a node by its own keys and nothing else.
+// Returns whether a control poses a node by its own keys and nothing else.
 bool StandsAlone(const CControl& control, const CNode& node)
 {
     const auto* track = dynamic_cast<const CKeyframeControl*>(&control);
@@ -22,7 +22,7 @@ CMotionSampler::CMotionSampler(CNode& root)
 {
 }
 
-// A control anywhere else could pose a node as well, so that there must be none.
+// Other controls could pose a node as well, so there must not be any.
 bool CMotionSampler::FindTracks()
 {
     std::vector<CObject*> controls;
@@ -57,7 +57,7 @@ void CMotionSampler::PoseTree(float time)
 
 float TimeOfFrame(int i, float frequency, float frameScale)
 {
-    // Rounded once, so that the frame position of a whole frame is that frame (CControl::MapTime).
+    // Rounded once, so that a whole frame's position maps back to exactly that frame (CControl::MapTime).
     return static_cast<float>(i / (static_cast<double>(frequency) * static_cast<double>(frameScale)));
 }
 

@@ -8,7 +8,7 @@ namespace {
 
 constexpr size_t kForgetInterval = size_t{8} << 20;
 
-// The characters before a line feed, without the carriage return that belongs to it.
+// Returns the characters before a line feed, without its carriage return.
 std::string_view CutLineEnd(std::string_view text, size_t feed)
 {
     const bool pair = feed > 0 && text[feed - 1] == '\r';
@@ -45,7 +45,7 @@ void CTextLines::ForgetRead()
     m_kFile.Forget(m_uiForgotten);
 }
 
-// What is left of the text. A line number begins with the first piece of a line.
+// Returns the rest of the text. The line number advances with the first piece of a line.
 std::string_view CTextLines::BeginRead()
 {
     m_kBefore = m_kNow;
@@ -60,8 +60,8 @@ bool CTextLines::Next(std::string_view& line)
     const std::string_view rest = BeginRead();
     if (rest.empty())
         return false;
-    // Behind the longest piece there may be room for its line end, which counts as one character more: a line
-    // of just this length comes as itself and an empty piece.
+    // The line end may follow the longest piece and counts as one more character: a line of exactly that
+    // length is returned as itself and an empty piece.
     const std::string_view window = rest.substr(0, kPieceLength + 2);
     const size_t feed = window.find('\n');
     line = feed == window.npos ? window : CutLineEnd(window, feed);

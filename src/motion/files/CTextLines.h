@@ -9,34 +9,34 @@
 
 namespace gw {
 
-/// A text file as a cursor over its lines. The file is mapped and never copied; views stay valid until the
-/// next Open or Close. LF and CR LF end lines, a byte order mark is skipped, a lone CR is an ordinary
-/// character.
+/// A cursor over the lines of a text file. The file is mapped, not copied; views stay valid until the next
+/// Open or Close. LF and CR LF end lines, a byte order mark is skipped, a single CR is an ordinary character.
 class CTextLines
 {
 public:
-    /// A longer line arrives in pieces of this many characters, each taken for a line by the readers of
-    /// keywords.
+    /// Longer lines are returned in pieces of this length. Readers of keywords treat each piece as a line.
     static constexpr size_t kPieceLength = 4095;
 
-    /// Replaces the text and rewinds. None on success, else why not; no lines then.
+    /// Opens a file in place of the current one, at its start. Returns None on success; after a failure,
+    /// there are no lines.
     EFailure Open(const std::string& path);
     void Close();
 
-    /// The next line, or the next piece of a long one, without its line end. False when the text is used up.
+    /// Reads the next line, or the next piece of a long one, without its line end. False at the end of the
+    /// text.
     bool Next(std::string_view& line);
-    /// All that is left of the line at the cursor, however long. False when the text is used up.
+    /// Reads the rest of the current line, however long. False at the end of the text.
     bool NextRow(std::string_view& row);
-    /// Puts the cursor back before what was read last, so that it is read again.
+    /// Moves the cursor back before the last line or piece.
     void StepBack();
 
-    /// The line that was read last, from 1 on as an editor counts; 0 before the first.
+    /// Returns the number of the last line read, starting at 1; 0 before the first.
     size_t LineNumber() const { return m_kNow.m_uiLine; }
     size_t BytesLeft() const { return m_kFile.Text().size() - m_kNow.m_uiOffset; }
     size_t ByteCount() const { return m_kFile.Text().size(); }
     /// See CMappedFile.
     bool IsWhole() const { return m_kFile.IsWhole(); }
-    /// Gives back the memory of what was read so far, when that is worth a call of the system.
+    /// Releases the memory of the lines read so far, if that is worth a system call.
     void ForgetRead();
 
 private:
@@ -44,7 +44,7 @@ private:
     {
         size_t m_uiOffset = 0;
         size_t m_uiLine = 0;
-        bool m_bInsideLine = false; ///< the next piece goes on with the same line
+        bool m_bInsideLine = false; ///< the next piece continues the same line
     };
 
     std::string_view BeginRead();
@@ -55,7 +55,7 @@ private:
     size_t m_uiForgotten = 0;
 };
 
-/// A word or line of a file for a failure record: its beginning, however long it is.
+/// Returns a word or line of a file, shortened for a failure record.
 std::string Quote(std::string_view text);
 
 } // namespace gw

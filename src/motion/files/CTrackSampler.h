@@ -11,21 +11,20 @@ namespace gw {
 class CControl;
 class CKeyframeControl;
 
-/// Reads the local matrix that a track gives its node at one time after another, without the node. Times
-/// between the same two keys share what does not change from one to the next. The track must stay as it is
-/// meanwhile.
+/// Samples the local matrix that a track gives its node at successive times, without the node. Times between
+/// the same two keys share the terms that do not change. Do not change the track while the sampler is in use.
 class CTrackSampler
 {
 public:
     explicit CTrackSampler(const CKeyframeControl& track) : track_(track) {}
 
-    /// Whether a control is a plain track that can be read here: no clips, one time axis, active, no parent
-    /// mask.
+    /// Returns whether a control is a plain track that can be sampled here: no clips, one time axis, active,
+    /// no parent mask.
     static bool CanSample(const CControl& control);
 
-    /// Goes to a caller's time. False if the pose is that of the last call, bit for bit.
+    /// Moves to a caller's time. Returns false if the pose equals that of the last call, bit for bit.
     bool MoveTo(float time);
-    /// The matrix that CKeyframeControl::UpdateTransform would write there.
+    /// Returns the matrix that CKeyframeControl::UpdateTransform would set.
     Mat4 Local() const;
 
 private:

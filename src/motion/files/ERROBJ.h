@@ -4,13 +4,12 @@
 
 namespace gw {
 
-/// What the reader of CHB files throws, and nothing else does. The facade catches it.
+/// Thrown only by the reader of CHB files, and caught by CMotionFile.
 struct ERROBJ
 {
-    int32_t code;   ///< 2, always
-    char where[80]; ///< which line of which source gave up
-    char what[256]; ///< how many keywords had been read, where one of them or a frame's number is wrong; else
-                    ///< empty
+    int32_t code;   ///< always 2
+    char where[80]; ///< source line that failed
+    char what[256]; ///< number of keywords read, if a keyword or frame number is wrong; otherwise empty
 };
 
 } // namespace gw

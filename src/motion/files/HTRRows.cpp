@@ -26,7 +26,7 @@ std::string_view SkipSeparators(std::string_view text)
     return {std::ranges::find_if_not(text, IsSeparator), text.end()};
 }
 
-// Passes over a number as "%d" does. False where there are no digits.
+// Skips a number as "%d" does. False if there are no digits.
 bool SkipInteger(std::string_view& text)
 {
     text = SkipSeparators(text);
@@ -89,8 +89,8 @@ bool CHTRReader::ReadSegment(std::string_view section)
     return true;
 }
 
-// Only where the file can hold as many rows for all segments, and not again for a second section of one name:
-// each exact reservation is a copy.
+// Only if the file can hold that many rows for all segments, and not for a second section with the same name,
+// because each exact reservation copies the array.
 void CHTRReader::ReserveRows(TKHTRSegment& segment)
 {
     const auto frames = static_cast<size_t>(std::max(file_.numFrames, 0));
@@ -101,8 +101,8 @@ void CHTRReader::ReserveRows(TKHTRSegment& segment)
     segment.scales.reserve(frames);
 }
 
-// The frame number is skipped: rows count in the order of the file. Values that a row does not have, be it
-// all of them, are those of the previous row.
+// Reads a row. The frame number is ignored: rows count in file order. Missing values, even all of them, are
+// taken from the previous row.
 bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span<float, 7> row)
 {
     size_t count = 0;
@@ -118,7 +118,7 @@ bool CHTRReader::ReadRow(TKHTRSegment& segment, std::string_view line, std::span
     return true;
 }
 
-// As sscanf takes numbers: what is stuck to one begins the next. Commas separate like blanks.
+// Reads numbers as sscanf does: characters directly after one start the next. Commas separate like blanks.
 bool CHTRReader::ReadNumbers(std::string_view text, std::span<float, 7> numbers, size_t& count)
 {
     for (count = 0; count < numbers.size(); ++count)

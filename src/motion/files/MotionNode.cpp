@@ -14,7 +14,7 @@ bool MayBeName(std::string_view name)
 
 bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes, size_t anySize)
 {
-    // A row usually takes at least two bytes per node, so ordinary files stay far below this.
+    // A row usually takes at least two bytes per node, so normal files are far below this.
     constexpr size_t kTimesPerByte = 4;
     const auto frames = static_cast<size_t>(std::max<int64_t>(frameCount, 0));
     return frames <= (fileBytes * kTimesPerByte + anySize) / std::max<size_t>(nodeCount, 1);

@@ -1,5 +1,5 @@
-// Retargeting takes both skeletons to stand in a T-pose at rest. A file that is being read has no body map
-// yet; the arms are found by the names of the hands.
+// Retargeting expects both skeletons to be in a T-pose at rest. While a file is being read there is no body
+// map yet, so the arms are found by the names of the hands.
 
 #include "RestPose.h"
 
@@ -34,7 +34,7 @@ BodyArm ArmOf(CNode& hand)
 
 void JudgeRestPose(CNode& motionRoot, CFailureRecord& record)
 {
-    // Fingers are called after their hand, so the first hand is the one that is under no other.
+    // Fingers are named after their hand, so the hand is the match that is not below another match.
     const std::vector<CNode*> nodes = NodesOf(motionRoot);
     const auto first = std::ranges::find_if(nodes, IsHand);
     const auto isOther = [&](const CNode* node) { return IsHand(node) && !IsAtOrBelow(node, *first); };

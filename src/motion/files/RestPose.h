@@ -6,8 +6,8 @@ namespace gw {
 
 class CNode;
 
-/// Warns where the rest pose of a motion's tree is no T-pose: where an arm does not point sideways. A
-/// skeleton whose arms are not found by the names of its hands is not judged.
+/// Warns if the rest pose of a motion's tree is not a T-pose, that is, if an arm does not point sideways. A
+/// skeleton whose arms cannot be found by hand names is not checked.
 void JudgeRestPose(CNode& motionRoot, CFailureRecord& record);
 
 } // namespace gw

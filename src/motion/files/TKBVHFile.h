@@ -13,32 +13,32 @@
 
 namespace gw {
 
-/// Channel codes are indices of this table: positions, rotations and scales about or along X, Y, Z.
+/// Channel codes are indices of this table: positions, rotations and scales along or about X, Y, Z.
 inline constexpr std::string_view kChannelNames[] = {"Xposition", "Yposition", "Zposition",
                                                      "Xrotation", "Yrotation", "Zrotation",
                                                      "Xscale",    "Yscale",    "Zscale"};
 inline constexpr int kFirstRotation = 3; ///< codes below are positions
-inline constexpr int kFirstScale = 6;    ///< codes from here on are read and have no effect
+inline constexpr int kFirstScale = 6;    ///< from here on: read, without effect
 
-/// What a block of the hierarchy is.
+/// The kind of a hierarchy block.
 enum class EJointKind : int
 {
-    Global, ///< stands above the file's root, made by the reader
+    Global, ///< above the file's root, created by the reader
     Root,
     Joint,
-    EndSite, ///< gives the bone before it its length and makes no node
+    EndSite, ///< determines the length of the bone before it, creates no node
 };
 
-/// A block of the hierarchy with what the motion rows gave it. Lengths in units of the file.
+/// A hierarchy block with the keys from the motion rows. Lengths are in file units.
 struct TKBVHJoint
 {
     EJointKind kind = EJointKind::Global;
     std::string name;
     Vec3 offset = kVec3Zero;
     std::vector<std::unique_ptr<TKBVHJoint>> children;
-    std::vector<int> channels; ///< codes in the order of the file
+    std::vector<int> channels; ///< codes in file order
 
-    // One key a frame, made of the row's values as they are read; none for a joint without channels.
+    // One key per frame, created as rows are read; empty for a joint without channels.
     std::vector<Quat> rotationKeys;
     CKeyArray<Vec3> positionKeys; ///< offset included
 
@@ -51,17 +51,17 @@ struct TKBVHJoint
     }
 };
 
-/// The parse context.
+/// The parsed file.
 struct TKBVHFile
 {
-    std::unique_ptr<TKBVHJoint> root; ///< the Global record; of its children only the first one counts
+    std::unique_ptr<TKBVHJoint> root; ///< the Global record; only its first child is used
     int frameCount = 0;
     float frameTime = 0.0f; ///< seconds
     size_t jointCount = 0;  ///< blocks of all kinds
-    size_t nodeCount = 0;   ///< blocks that make a node
-    int64_t rowsAsked = 0;  ///< frames of all motions in the file, of which there should be one
+    size_t nodeCount = 0;   ///< blocks that create a node
+    int64_t rowsAsked = 0;  ///< frames of all motions in the file, which should contain one
 
-    /// The file's root joint, or null.
+    /// Returns the file's root joint, or null.
     TKBVHJoint* FirstRoot() const
     {
         return root && !root->children.empty() ? root->children[0].get() : nullptr;

@@ -1,3 +1,14 @@
+// Reads BVH files into a tree. Two steps need explanation.
+//
+// Bone meshes point along +Y, but a BVH joint's child can be anywhere, so each mesh is rotated to the child
+// by BoneTurn: first about Z, then about Y. The two angles are computed independently from the offset's
+// projections, which is exact only if the offset lies in one of those planes. Other programs read these
+// frames, so the formula stays as it is.
+//
+// A joint without channels takes no byte in a row but still gets a key time per frame. A short file could
+// therefore claim billions of key times, and the product of frames and joints is limited by kKeyTimesLimit
+// before anything is allocated.
+
 #include "TKBVHStream.h"
 
 #include "Angles.h"
@@ -17,10 +28,10 @@ namespace gw {
 
 namespace {
 
-// 256 MB of key times. The file holds a row for every frame, but a joint without channels takes no byte of a
+// 256 MB of key times. The file holds a row for every frame, but a joint without channels takes no bytes in a
 // row and still gets a time for each.
 constexpr size_t kKeyTimesLimit = size_t{1} << 26;
-constexpr float kNoLength = 9.9999997e-07f; // the float of 1e-06, below which an offset has no direction
+constexpr float kNoLength = 9.9999997e-07f; // the float of 1e-06; a shorter offset has no direction
 
 float SignedBy(float sign, double angle)
 {
@@ -35,7 +46,7 @@ float LongestOffset(const TKBVHJoint& joint)
     return static_cast<float>(longest);
 }
 
-// The first end site below a joint, or zero.
+// Returns the first end site below a joint, or zero.
 Vec3 EndOf(const TKBVHJoint& joint)
 {
     const auto end =
@@ -103,7 +114,7 @@ bool TKBVHStream::ReadMotion(TKBVHFile& file)
     return true;
 }
 
-// The next line, which must begin with these words. No blank line may stand before it.
+// Reads the next line, which must start with these words and must not be preceded by a blank line.
 bool TKBVHStream::ReadKeyword(std::string_view words, std::string_view& rest)
 {
     const std::string name(words);
@@ -120,7 +131,7 @@ bool TKBVHStream::ReadKeyword(std::string_view words, std::string_view& rest)
     return true;
 }
 
-// The number behind these words on the next line, for which it must be finite.
+// Reads the finite number after these words on the next line.
 bool TKBVHStream::ReadNumber(std::string_view words, std::string_view& number)
 {
     std::string_view rest;

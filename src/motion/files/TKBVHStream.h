@@ -12,14 +12,14 @@ struct BVHWriteRules;
 struct TKBVHFile;
 struct TKBVHJoint;
 
-/// What turns +Y, the axis of a bone mesh, to where the only child of a BVH joint stands: about Z by the
-/// offset's direction in the XY plane, about Y by that in the XZ plane. So the frame of a bone that slants
-/// only a little from -Y is turned about the bone by up to a quarter turn.
+/// Returns the rotation from +Y, the axis of a bone mesh, to the only child of a BVH joint: about Z by the
+/// offset's direction in the XY plane, then about Y by that in the XZ plane. The frame of a bone slightly off
+/// -Y can thus be rotated about the bone by up to a quarter turn.
 Mat3 BoneTurn(const Vec3& offset);
 
-/// Biovision hierarchy files. Reading makes a tree of nodes, one for each ROOT and JOINT; positions are added
-/// to the offset on every joint that carries them, and the order of a joint's rotations is the order of its
-/// channels. Lengths stay in units of the file.
+/// Biovision hierarchy files. Reading creates a tree with one node for each ROOT and JOINT. Positions are
+/// added to the offset on every joint that has position channels, and a joint's rotations are applied in
+/// channel order. Lengths stay in file units.
 class TKBVHStream : public CMotionFile
 {
 public:
@@ -27,17 +27,17 @@ public:
     /// Shares the other's trees, for writing.
     explicit TKBVHStream(const CMotionFile& trees) : CMotionFile(trees) {}
 
-    /// Fills motionRoot. False, with the reason in Record(), for what is no BVH file.
+    /// Fills motionRoot. Returns false, with the reason in Record(), if the file is not valid BVH.
     bool Load(const std::string& path) override;
-    /// Writes motionRoot with its rest pose as offsets, rotations in the order Z, Y, X and positions at the
-    /// root. The last frame of the motion is left out, as it has always been. False without a motion or when
-    /// the file cannot be written. Leaves the tree's controls switched on.
+    /// Writes motionRoot with its rest pose as offsets, rotations in the order Z, Y, X, and positions at the
+    /// root. Omits the last frame of the motion, as it always has. Returns false without a motion or if the
+    /// file cannot be written. Leaves the tree's controls switched on.
     virtual bool WriteFile(const std::string& path);
-    /// Writes motionRoot whole, for readers that take it for the motion itself: all frames, the ends of bones
-    /// where they are, rotations also where two of their axes meet, position channels on the joints whose
-    /// positions are not their offsets, and the frame time in all its digits. False as above.
+    /// Writes motionRoot completely, for readers that need the motion itself: all frames, true bone ends,
+    /// rotations that are correct in gimbal lock, position channels on joints whose positions differ from
+    /// their offsets, and the frame time with all its digits. Returns false as WriteFile does.
     bool WriteExact(const std::string& path);
-    /// Gives a node the bone mesh that reaches to its joint's children; none to a joint without any.
+    /// Gives a node the bone mesh that reaches to its joint's children; nothing if it has none.
     virtual void AddBoneShape(const TKBVHFile& file, const TKBVHJoint& joint, CNode& node);
 
 private:

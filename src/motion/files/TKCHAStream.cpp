@@ -22,7 +22,7 @@ bool TKCHAStream::WriteFile(const std::string&)
     return m_kRecord.Fail(EFailure::UnknownFormat);
 }
 
-// The end is one frame before the last number of the header, as it has always been.
+// The motion ends one frame before the header's last number, as it always has.
 bool TKCHAStream::BuildAnimatedTree(TKCHFile& file)
 {
     motionRoot = new CNode;

@@ -9,14 +9,14 @@ namespace gw {
 struct TKCHFile;
 struct TKCHSegment;
 
-/// Character animation files as text: for every segment and frame a matrix and a position, both local. Read
-/// only. Lengths stay in units of the file.
+/// Character animation files as text: a local matrix and position for every segment and frame. Read only.
+/// Lengths stay in file units.
 class TKCHAStream : public CMotionFile
 {
 public:
-    /// Fills motionRoot. False, with the reason in Record(), for what is no CHA file.
+    /// Fills motionRoot. Returns false, with the reason in Record(), if the file is not valid CHA.
     bool Load(const std::string& path) override;
-    /// The format is not written: false, and no file is touched.
+    /// Writing is not supported: returns false and touches no file.
     virtual bool WriteFile(const std::string& path);
     /// Gives a node the bone mesh of its segment.
     virtual void AddBoneShape(const TKCHFile& file, const TKCHSegment& segment, CNode& node);

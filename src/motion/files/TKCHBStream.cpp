@@ -1,6 +1,6 @@
-// Nothing in the format says how long it is: a keyword, a number and a name follow each other as the header
-// promises. So every field is asked for by its length, and the first one that is not there or is another than
-// it must be ends the reading by an exception.
+// The format does not store its length: keywords, numbers and names follow each other as the header promises.
+// So every field is read with its expected length, and the first one that is missing or wrong ends reading
+// with an exception.
 
 #include "TKCHBStream.h"
 
@@ -106,8 +106,8 @@ void TKCHBStream::ReadHierarchy(TKCHFile& file)
     file.LinkSegments(m_kRecord, m_uiPosition);
 }
 
-// Frames are numbered from beginFrame on and read up to frameCount, so that as many as stand before
-// beginFrame stay unread at the end. It has always been so.
+// Frames are numbered from beginFrame on but read up to frameCount, so the last beginFrame frames stay
+// unread. It has always been so.
 void TKCHBStream::ReadMotion(TKCHFile& file)
 {
     ReadKeyword("[MOTION]");
@@ -138,8 +138,8 @@ void TKCHBStream::ReadFrame(int number)
     }
 }
 
-// The first key is the frame at index beginFrame of those that were read. Where there are no more, the last
-// one stays, which is what a track does with keys that are missing.
+// The first key is the frame at index beginFrame of those that were read. If there are too few, the last one
+// is repeated, as a track does for missing keys.
 void TKCHBStream::TakeFrames(TKCHFile& file)
 {
     for (TKCHSegment& work : m_kWork)

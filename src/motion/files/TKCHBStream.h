@@ -12,15 +12,15 @@
 
 namespace gw {
 
-/// Character animation files in binary: the same records as in a CHA file, field after field. Read only.
-/// Every motion has the same fixed frequency, whatever the rate in the file.
+/// Binary character animation files: the same records as in a CHA file, field by field. Read only. Every
+/// motion has the same fixed frequency, whatever rate the file stores.
 class TKCHBStream : public CMotionFile
 {
 public:
-    /// Fills motionRoot. False for a file that cannot be opened and for one without a root segment; throws
-    /// ERROBJ for one that is cut short or damaged. The reason is in Record() both times.
+    /// Fills motionRoot. Returns false if the file cannot be opened or has no root segment; throws ERROBJ if
+    /// it is truncated or damaged. The reason is in Record() in both cases.
     bool Load(const std::string& path) override;
-    /// The format is not written: false, and no file is touched.
+    /// Writing is not supported: returns false and touches no file.
     virtual bool WriteFile(const std::string& path);
     /// Gives a node the bone mesh of its segment.
     virtual void AddBoneShape(const TKCHFile& file, const TKCHSegment& segment, CNode& node);
@@ -29,8 +29,7 @@ protected:
     bool IsSourceWhole() const override { return m_kFile.IsWhole(); }
 
 private:
-    // The line of the source that asks, as a default argument tells it. Not every compiler that builds this
-    // has the library's class for it.
+    // The calling source line, as a default argument. Not every supported compiler has std::source_location.
     using Line = int;
 
     bool ReadFile(TKCHFile& file);
@@ -49,12 +48,12 @@ private:
     std::string_view TakeBytes(size_t count, Line line);
     [[noreturn]] void Raise(EFailure reason, const std::string& name, Line line,
                             const std::string& what = {});
-    /// What an exception tells of a keyword or a frame that is another than it must be.
+    /// Returns the text of an exception about an unexpected keyword or frame number.
     std::string LineText() const;
 
     CMappedFile m_kFile;
     size_t m_uiPosition = 0;
-    int m_iLine = 0; // keywords read: each begins a line in the text twin of the format
+    int m_iLine = 0; // keywords read; each starts a line in the text version of the format
     std::vector<TKCHSegment> m_kWork;
 };
 

@@ -11,7 +11,7 @@ namespace {
 
 constexpr const char* kRootName = "Global";
 
-// A tree, so that this ends, and of no more levels than there can be segments.
+// The segments form a tree with at most kSegmentLimit levels, so recursion ends.
 TKCHSegment* FindBelow(const TKCHSegment& parent, std::string_view name)
 {
     for (TKCHSegment* child : parent.children)

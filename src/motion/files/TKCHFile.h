@@ -13,10 +13,10 @@
 
 namespace gw {
 
-/// The size of the work array: files of more segments, or of more rows in a frame, are refused.
+/// The size of the work array: files with more segments, or more rows per frame, are refused.
 inline constexpr int kSegmentLimit = 100;
 
-/// A segment with its frames. Matrices are local and act on row vectors, lengths stay in units of the file.
+/// A segment with its frames. Matrices are local and apply to row vectors; lengths are in file units.
 struct TKCHSegment
 {
     std::string parentName;
@@ -29,7 +29,7 @@ struct TKCHSegment
     bool MakesNode() const { return true; }
 };
 
-/// The parse context of CHA and CHB files: the header's numbers and the hierarchy.
+/// The parsed CHA or CHB file: the header's numbers and the hierarchy.
 struct TKCHFile
 {
     int versionNumber = 0;
@@ -38,22 +38,22 @@ struct TKCHFile
     int endFrame = 0;
     int numSegments = 0;
     int frameCount = 0;
-    std::unique_ptr<TKCHSegment> root;                  ///< the record "Global", or null before a hierarchy
-    std::vector<std::unique_ptr<TKCHSegment>> segments; ///< those that count, in the order of the file
+    std::unique_ptr<TKCHSegment> root;                  ///< the record "Global", or null before the hierarchy
+    std::vector<std::unique_ptr<TKCHSegment>> segments; ///< the counted segments, in file order
     std::vector<std::pair<std::string_view, float>> lengths; ///< bone lengths by name, views into the text
 
-    /// Sets frameCount to the frames from beginFrame to endFrame.
+    /// Sets frameCount to the number of frames from beginFrame to endFrame.
     void CountFrames();
-    /// Begins a hierarchy anew.
+    /// Starts a new hierarchy.
     void MakeRoot();
-    /// Adds a record to the hierarchy, of the first length of its name. It hangs nowhere yet.
+    /// Adds a record to the hierarchy, with the first length stored for its name. It is not attached yet.
     void AddSegment(std::string_view name, std::string_view parentName);
-    /// Hangs every record under its parent, of equal names the first. Records without a known parent are left
-    /// out with all below them, and noted as warnings at a line.
+    /// Attaches every record to its parent; for equal names, the first one. Records without a known parent
+    /// are left out with their subtrees, and warned about at a line.
     void LinkSegments(CFailureRecord& record, size_t line);
-    /// The file's root segment, or null.
+    /// Returns the file's root segment, or null.
     TKCHSegment* FirstRoot() const { return root && !root->children.empty() ? root->children[0] : nullptr; }
-    /// The first record of a name under the root, depth first, or null.
+    /// Returns the first record with a name under the root, depth first, or null.
     TKCHSegment* FindSegment(std::string_view name) const;
 };
 

@@ -12,7 +12,7 @@
 
 namespace gw {
 
-/// A segment with its base pose and its rows. Angles are degrees; a row is a delta on the base pose.
+/// A segment with its base pose and rows. Angles are in degrees; rows are relative to the base pose.
 struct TKHTRSegment
 {
     std::string parentName;
@@ -22,17 +22,17 @@ struct TKHTRSegment
     float boneLength = 0.0f;
     std::vector<TKHTRSegment*> children; ///< owned by the file
 
-    // One entry for each data row.
+    // One entry per data row.
     std::vector<Vec3> translations;
     std::vector<Vec3> rotations;
     std::vector<float> scales;
 
-    size_t line = 0; ///< where the hierarchy names it
+    size_t line = 0; ///< line of its name in the hierarchy
 
     bool MakesNode() const { return true; }
 };
 
-/// The parse context, with the fields of the header.
+/// The parsed file, with the header fields.
 struct TKHTRFile
 {
     std::string fileType;
@@ -42,30 +42,30 @@ struct TKHTRFile
     std::string rotationUnits;
     char gravityAxis = '\0';
     char boneLengthAxis = '\0';
-    int fileVersion = 1; ///< what a file without the key hands on
+    int fileVersion = 1; ///< default if the key is missing
     int numSegments = 0;
     int numFrames = 0;
     int dataFrameRate = 0;
     float scaleFactor = 0.0f;
 
-    TKHTRSegment* root = nullptr; ///< the record "GLOBAL" above the hierarchy, or null before there is one
+    TKHTRSegment* root = nullptr; ///< the record "GLOBAL" above the hierarchy, or null before it
     std::vector<std::unique_ptr<TKHTRSegment>> segments; ///< all records
     std::unordered_map<std::string_view, TKHTRSegment*>
-        segmentOfName; ///< those under the root, the first of a name
+        segmentOfName; ///< those under the root; the first of each name
 
-    /// The file's root segment, or null.
+    /// Returns the file's root segment, or null.
     TKHTRSegment* FirstRoot() const { return root && !root->children.empty() ? root->children[0] : nullptr; }
 };
 
-/// A text field of the header. The format reserves a fixed number of characters for it, one of them for the
-/// terminator; longer values are cut.
+/// A text field of the header. The format reserves a fixed number of characters, including the terminator;
+/// longer values are truncated.
 struct HTRText
 {
     std::string TKHTRFile::*text;
-    size_t size; ///< with the terminator
+    size_t size; ///< including the terminator
 };
 
-/// A key of the header and the field that it fills.
+/// A header key and the field that it sets.
 struct HTRKey
 {
     using Field = std::variant<HTRText, char TKHTRFile::*, int TKHTRFile::*, float TKHTRFile::*>;
@@ -74,7 +74,7 @@ struct HTRKey
     Field field;
 };
 
-/// All keys, in the order of writing.
+/// All keys, in writing order.
 inline constexpr HTRKey kHTRKeys[] = {
     {"FileType",            HTRText{&TKHTRFile::fileType, 4}        },
     {"DataType",            HTRText{&TKHTRFile::dataType, 8}        },

@@ -1,3 +1,7 @@
+// Builds the rest tree and the animated tree from the records of an HTR file. A row's rotation is composed
+// axis by axis onto the base pose in an inner loop (RotatedBase), since a file has one per segment and frame.
+// Each segment's rows are freed as soon as its keys exist.
+
 #include "TKHTRStream.h"
 
 #include "Angles.h"
@@ -16,8 +20,8 @@ namespace gw {
 
 namespace {
 
-// The axes of a rotation order (0 X, 1 Y, 2 Z) in the order of its letters, which is the order in which their
-// rotations are multiplied in from the left. None for an unknown order: it drops the rotation.
+// Returns the axes of a rotation order (0 X, 1 Y, 2 Z) in the order of its letters, in which their rotations
+// are multiplied from the left. Empty for an unknown order, which drops the rotation.
 std::vector<size_t> AxesOf(std::string_view order)
 {
     if (!std::ranges::is_permutation(order, std::string_view("XYZ")))
@@ -28,7 +32,7 @@ std::vector<size_t> AxesOf(std::string_view order)
     return axes;
 }
 
-// EulerToMat3(order, degrees) · base, for the inner loop.
+// Returns EulerToMat3(order, degrees) · base, for the inner loop.
 Mat3 RotatedBase(const std::vector<size_t>& axes, const Vec3& degrees, const Mat3& base)
 {
     const float angles[] = {degrees.x, degrees.y, degrees.z};
@@ -107,7 +111,7 @@ void TKHTRStream::FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment,
     const float frequency = 1.0f / static_cast<float>(file.dataFrameRate);
     CKeyframeControl& track = AttachTrack(node, file.numFrames, frequency, BaseMatrix(file, segment));
     AppendKeys(track, segment, AxesOf(file.eulerOrder), EulerToMat3(file.eulerOrder, segment.baseRotation));
-    // Rows are not needed again, and a large file's keys take their place.
+    // Rows are no longer needed, and their memory makes room for a large file's keys.
     segment.translations = {};
     segment.rotations = {};
     segment.scales = {};

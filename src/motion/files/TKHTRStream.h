@@ -9,9 +9,9 @@ namespace gw {
 struct TKHTRFile;
 struct TKHTRSegment;
 
-/// Hierarchical translation-rotation files: the one format that is written by Save and that holds a rest pose
-/// beside the motion. A row's rotation is a delta on the base pose that acts first, its translation an offset
-/// from the base translation. Angles are degrees, lengths stay in units of the file.
+/// Hierarchical translation-rotation files, the only format that Save writes and the only one with a rest
+/// pose besides the motion. A row's rotation is applied before the base pose's; its translation is added to
+/// the base translation. Angles are degrees, lengths stay in file units.
 class TKHTRStream : public CMotionFile
 {
 public:
@@ -19,11 +19,12 @@ public:
     /// Shares the other's trees, for writing.
     explicit TKHTRStream(const CMotionFile& trees) : CMotionFile(trees) {}
 
-    /// Fills restRoot and motionRoot. False, with the reason in Record(), for what is no HTR file.
+    /// Fills restRoot and motionRoot. Returns false, with the reason in Record(), if the file is not valid
+    /// HTR.
     bool Load(const std::string& path) override;
     /// Writes restRoot as base pose and motionRoot as rows, with frameScale times as many frames at the same
-    /// rate. False where one is missing or the file cannot be written. Leaves the motion switched on, at time
-    /// 0.
+    /// rate. Returns false if a tree is missing or the file cannot be written. Leaves the motion switched on,
+    /// at time 0.
     bool Save(const std::string& path, float frameScale) override;
     bool SaveText(const CByteSink& sink, float frameScale) override;
     /// Gives a node the bone mesh of its segment.

@@ -5,24 +5,24 @@
 
 namespace gw {
 
-// What a body that is posed shows. Places and directions are world space, from the nodes' world matrices.
+// Measures of a posed body. Positions and directions are in world space, from the nodes' world matrices.
 
 inline Vec3 PlaceOf(const CNode& node)
 {
     return node.m_kWorldMatrix.Translation();
 }
-/// The way from one joint to another; zero where one is missing.
+/// Returns the vector from one joint to another; zero if one is missing.
 Vec3 WayTo(const CNode* from, const CNode* to);
-/// A world direction in the space of a posed node.
+/// Converts a world direction to the space of a posed node.
 Vec3 LocalDirection(const Vec3& direction, const CNode& node);
-/// From the right thigh to the left one.
+/// Returns the vector from the right thigh to the left one.
 Vec3 HipLine(const CBodyMap& body);
-/// From the right upper arm to the left one; zero where one is missing.
+/// Returns the vector from the right upper arm to the left one; zero if one is missing.
 Vec3 ShoulderLine(const CBodyMap& body);
-/// The joint at the upper end of the spine: the neck, else the head, else the last joint there is; null for
-/// a body of legs.
+/// Returns the joint at the upper end of the spine: the neck, otherwise the head, otherwise the last spine
+/// joint; null for a body without a trunk.
 CNode* TrunkTop(const CBodyMap& body);
-/// Thigh to knee to ankle of the longer leg.
+/// Returns the length of the longer leg, from thigh to knee to ankle.
 double LegLength(const CBodyMap& body);
 
 } // namespace gw

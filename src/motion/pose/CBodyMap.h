@@ -9,7 +9,7 @@ namespace gw {
 
 class CNode;
 
-/// The side of the body, by its own right and left.
+/// A side of the body, from the body's own point of view.
 enum class EBodySide : uint8_t
 {
     Left,
@@ -17,7 +17,7 @@ enum class EBodySide : uint8_t
 };
 inline constexpr std::array kBodySides{EBodySide::Left, EBodySide::Right};
 
-/// The joints of one arm; each turns the bone below it. Null for one that the skeleton does not have.
+/// The joints of one arm; each rotates the bone below it. Null if the skeleton lacks it.
 struct BodyArm
 {
     CNode* clavicle = nullptr;
@@ -26,7 +26,7 @@ struct BodyArm
     CNode* hand = nullptr;
 };
 
-/// The joints of one leg; each turns the bone below it. Null for one that the skeleton does not have.
+/// The joints of one leg; each rotates the bone below it. Null if the skeleton lacks it.
 struct BodyLeg
 {
     CNode* thigh = nullptr;
@@ -35,10 +35,10 @@ struct BodyLeg
     CNode* toe = nullptr;  ///< the ball of the foot
 };
 
-/// Which joints of a skeleton are those of a human body. The nodes are looked at and not kept alive.
+/// The joints of a skeleton that belong to a human body. The nodes are not kept alive.
 struct CBodyMap
 {
-    CNode* hip = nullptr;      ///< the joint that carries the body's motion, where legs and spine part
+    CNode* hip = nullptr;      ///< the joint that carries the body's motion, where legs and spine meet
     std::vector<CNode*> spine; ///< from the pelvis upward, without hip and neck
     std::vector<CNode*> neck;  ///< upward, without the head
     CNode* head = nullptr;
@@ -50,10 +50,10 @@ struct CBodyMap
     BodyLeg& Leg(EBodySide side) { return legs[static_cast<size_t>(side)]; }
     const BodyLeg& Leg(EBodySide side) const { return legs[static_cast<size_t>(side)]; }
 
-    /// The thirteen joints that drive a whole body are there: hip, a spine joint, head, and on each side
-    /// upper arm, forearm, hand, thigh and shin.
+    /// Returns whether the thirteen joints that drive a whole body are present: hip, a spine joint, head, and
+    /// on each side upper arm, forearm, hand, thigh and shin.
     bool DrivesBody() const;
-    /// And the two feet besides, without which none can be planted.
+    /// Returns whether DrivesBody holds and both feet are present, without which no foot can be planted.
     bool HasFeet() const;
 };
 

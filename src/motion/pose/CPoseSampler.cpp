@@ -50,7 +50,7 @@ void CPoseSampler::Pose(double frame)
     const auto time = static_cast<float>(frame / m_fFrequency);
     for (CNode* node : m_kNodes)
         node->CSpatial::UpdateTransform(
-            time); // this node alone: a node's own operation goes on to its children
+            time); // this node alone: UpdateScene would continue to its children
 }
 
 Mat4 RestWorld(const CNode& node)

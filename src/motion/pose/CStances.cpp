@@ -11,7 +11,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kMostFrames = 16;
-constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 31 MB with tips and turns
+constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 31 MB with tips and rotations
 
 const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
 {
@@ -24,7 +24,7 @@ const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
     return nullptr;
 }
 
-// Puts the nodes of a tree back to where they were.
+// Restores the pose of a tree.
 class CPoseKeeper
 {
 public:

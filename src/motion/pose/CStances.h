@@ -12,30 +12,30 @@ namespace gw {
 
 class CNode;
 
-/// Where all joints of a skeleton are in its rest pose and in some frames spread over its motion. Many files
-/// have rest poses in which nobody could stand, so that what a body looks like is judged over several poses.
-/// The tree is posed meanwhile and left as it was.
+/// The joint positions of a skeleton in its rest pose and in some frames spread over its motion. Many files
+/// have rest poses in which nobody could stand, so a body is judged over several poses. The tree is posed
+/// during construction and left as it was.
 class CStances
 {
 public:
     explicit CStances(CNode& root);
 
-    /// The joints, depth first.
+    /// Returns the joints, depth first.
     const std::vector<CNode*>& Joints() const { return tree_->Joints(); }
-    /// The index of a joint; -1 for null and for one of another tree.
+    /// Returns the index of a joint; -1 for null or a joint of another tree.
     int IndexOf(const CNode* joint) const { return tree_->IndexOf(joint); }
 
-    /// The number of poses. The first one is the rest pose.
+    /// Returns the number of poses. The first one is the rest pose.
     size_t Count() const { return m_kPlaces.size(); }
-    /// The place of a joint in a pose, world space.
+    /// Returns the position of a joint in a pose, world space.
     const Vec3& Place(size_t stance, int joint) const
     {
         return m_kPlaces[stance][static_cast<size_t>(joint)];
     }
-    /// Where the bone of an end joint ends; the joint's own place where that is not known.
+    /// Returns the end of an end joint's bone, or the joint's position if the end is unknown.
     const Vec3& Tip(size_t stance, int joint) const { return m_kTips[stance][static_cast<size_t>(joint)]; }
 
-    /// The rotation of a joint in a pose, from its own space to the world.
+    /// Returns the rotation of a joint in a pose, from its own space to world space.
     const Mat3& Turn(size_t stance, int joint) const { return m_kTurns[stance][static_cast<size_t>(joint)]; }
 
 private:

@@ -7,16 +7,16 @@
 
 namespace gw {
 
-/// All joints of a motion, depth first, and their world matrices in its rest pose or at a frame. The tree
-/// must stay as it is meanwhile.
+/// All joints of a motion, depth first, with their world matrices in the rest pose or at a frame. Do not
+/// change the tree while the poser is in use.
 class CTreePoser
 {
 public:
-    /// The joints of the tree are NodesOf its root.
+    /// `joints` is NodesOf the tree's root.
     CTreePoser(std::vector<CNode*> joints, float frequency);
 
     const std::vector<CNode*>& Joints() const { return m_kJoints; }
-    /// The place of a joint in that list, or -1.
+    /// Returns the index of a joint in that list, or -1.
     int IndexOf(const CNode* joint) const;
     int ParentOf(size_t joint) const { return IndexOf(m_kJoints[joint]->GetParentNode()); }
 

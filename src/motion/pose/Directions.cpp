@@ -1,3 +1,6 @@
+// Angles and rotations between directions. Angles are computed from sine and cosine together, because the arc
+// cosine of a float cannot resolve angles below a fiftieth of a degree.
+
 #include "Directions.h"
 
 #include "Angles.h"
@@ -11,7 +14,7 @@ namespace {
 
 constexpr double kNoLength = 1e-9;
 
-// Some unit vector across a direction.
+// Returns a unit vector perpendicular to a direction.
 Vec3 AnyAcross(const Vec3& direction)
 {
     const Vec3 unit = Vec3Normalized(direction);
@@ -72,7 +75,7 @@ double TwistBetween(const Vec3& from, const Vec3& to, const Vec3& axis)
     return std::atan2(Vec3Dot(Vec3Cross(a, b), axis), Vec3Dot(a, b)) * kRadiansToDegrees64;
 }
 
-// By sine and cosine together: an arc cosine of floats knows no angle below a fiftieth of a degree.
+// From sine and cosine together: the arc cosine of floats cannot resolve angles below a fiftieth of a degree.
 double AngleBetween(const Vec3& a, const Vec3& b)
 {
     return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;

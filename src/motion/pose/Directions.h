@@ -6,35 +6,35 @@
 
 namespace gw {
 
-// Directions, angles and the rotations between them. Rotations are row matrices: a direction d becomes d · M.
+// Directions, angles and rotations between them. Rotations are row matrices: a direction d becomes d · M.
 
-/// A direction turned by a rotation; one in a space of these axes, as the world has it.
+/// Returns a rotated direction; equivalently, converts a local direction to world space.
 Vec3 Turned(const Vec3& direction, const Mat3& turn);
-/// A world direction in a space of these axes.
+/// Converts a world direction to the space of these axes.
 Vec3 ToLocal(const Vec3& direction, const Mat3& axes);
-/// A direction without its part along a unit vector.
+/// Returns a direction without its component along a unit vector.
 Vec3 Across(const Vec3& direction, const Vec3& axis);
-/// The world axis, plus or minus, that is nearest to a direction.
+/// Returns the world axis, positive or negative, closest to a direction.
 Vec3 NearestAxis(const Vec3& direction);
-/// "Y" or "-Z".
+/// Returns "Y" or "-Z".
 std::string_view AxisName(const Vec3& axis);
 
-/// The angle between two directions in degrees, exact for small angles too. Not to be asked of one without
-/// a length.
+/// Returns the angle between two directions in degrees, accurate for small angles too. Both must have a
+/// length.
 double AngleBetween(const Vec3& a, const Vec3& b);
-/// The angle in degrees, -180 to 180, by which a rotation about `axis`, a unit vector, takes one direction to
-/// another as seen along it; 0 if one of them lies along the axis.
+/// Returns the signed angle in degrees, -180 to 180, of the rotation about the unit vector `axis` from one
+/// direction to another, seen along the axis; 0 if one of them lies along it.
 double TwistBetween(const Vec3& from, const Vec3& to, const Vec3& axis);
-/// The angle of a rotation in degrees, 0 to 180.
+/// Returns the angle of a rotation in degrees, 0 to 180.
 double AngleOf(const Mat3& turn);
 
-/// The rotation about a unit vector by an angle in degrees.
+/// Returns the rotation about a unit vector by an angle in degrees.
 Mat3 TurnAbout(const Vec3& axis, double degrees);
-/// The rotation by the least angle that takes one direction to another; half a turn about some axis across if
+/// Returns the smallest rotation from one direction to another; half a turn about any perpendicular axis if
 /// they are opposite. The identity if one has no length.
 Mat3 LeastSwing(const Vec3& from, const Vec3& to);
-/// The rotation that takes `up` to +Y and `left` as near to +X as it can. A `left` along `up` leaves the
-/// turn about it open.
+/// Returns the rotation that takes `up` to +Y and `left` as close to +X as possible. If `left` is parallel to
+/// `up`, the rotation about +Y is arbitrary.
 Mat3 TurnUpright(const Vec3& up, const Vec3& left);
 
 } // namespace gw

@@ -5,9 +5,9 @@
 
 namespace gw {
 
-// The bones of the host skeleton, which every result has, by name.
+// Names of the host skeleton's bones, which every result contains.
 
-/// The bone whose mapping every conversion needs.
+/// The bone that every conversion must map.
 inline constexpr const char* kRootBone = "LowerTorso";
 inline constexpr const char* kWaistBone = "Waist";
 inline constexpr const char* kTorsoBone = "UpperTorso";
@@ -31,10 +31,10 @@ inline constexpr HostSide kLeftBones{"LCollar", "LUpperArm", "LForearm", "LHand"
                                      "LThigh",  "LCalf",     "LFoot",    "LToe"};
 inline constexpr HostSide kRightBones{"RCollar", "RUpperArm", "RForearm", "RHand", "RPelvis",
                                       "RThigh",  "RCalf",     "RFoot",    "RToe"};
-/// By EBodySide.
+/// Indexed by EBodySide.
 inline constexpr std::array kHostSides{kLeftBones, kRightBones};
 
-/// The bones that no source drives: every profile has a fixed row for each.
+/// The bones that no source bone drives: every profile has a fixed row for each.
 inline constexpr std::string_view kPelvisBones[] = {kLeftBones.pelvis, kRightBones.pelvis};
 
 } // namespace gw

@@ -9,10 +9,10 @@ namespace gw {
 
 namespace {
 
-// Joints no farther apart than this, by how far from the origin they are, are at the same place: rounding is
-// a tenth of it, and the shortest bones are a thousand times longer.
+// Joints closer together than this, relative to their distance from the origin, are at the same place:
+// rounding is a tenth of it, and the shortest bones are a thousand times longer.
 constexpr double kSamePlace = 1e-6;
-// Of a shin, what the bones of an ankle take up at most; the ball of a foot lies at a quarter.
+// The bones of an ankle take up at most this share of the shin; the ball of a foot is at a quarter.
 constexpr double kAnkleShare = 0.05;
 
 bool ArePlacedApart(const CNode& a, const CNode& b)
@@ -20,7 +20,7 @@ bool ArePlacedApart(const CNode& a, const CNode& b)
     return ArePlacedApart(a.m_kWorldMatrix.Translation(), b.m_kWorldMatrix.Translation());
 }
 
-// How many joints go on below one another; more than a finger has are as many as a finger has.
+// Returns the length of the chain of joints below; more than a finger has count as a finger's.
 size_t BranchLength(CNode& top)
 {
     constexpr size_t kMost = 5;
@@ -39,7 +39,7 @@ size_t BranchLength(CNode& top)
     return length;
 }
 
-// The first of the longest: a heel that ends at once does not stand for the toes.
+// The first of the longest branches: a heel without children must not be mistaken for the toes.
 CNode* LongestBranch(const CNode& node)
 {
     const std::vector<CNode*> children = ChildNodes(node);
@@ -48,7 +48,7 @@ CNode* LongestBranch(const CNode& node)
     return *std::ranges::max_element(children, {}, [](CNode* child) { return BranchLength(*child); });
 }
 
-// The child of a node on the way down to another, or null where that is not below.
+// Returns a node's child on the path down to another node, or null if that is not below.
 CNode* ChildTowards(const CNode& node, CNode* below)
 {
     while (below && below->GetParentNode() != &node)

@@ -8,13 +8,13 @@
 
 namespace gw {
 
-/// The first node of a name under a root, itself included, or null.
+/// Returns the first node with a name at or below a root, or null.
 inline CNode* FindNode(CNode* root, const char* name)
 {
     return root ? static_cast<CNode*>(root->FindObject(name, &CNode::ms_kRTTI, true)) : nullptr;
 }
 
-/// All nodes under a root, itself included, depth first.
+/// Returns all nodes at or below a root, depth first.
 inline std::vector<CNode*> NodesOf(CNode& root)
 {
     std::vector<CObject*> found;
@@ -26,14 +26,14 @@ inline std::vector<CNode*> NodesOf(CNode& root)
     return nodes;
 }
 
-/// The nodes of a tree by their exact names, for several look-ups while the tree does not change. Bodies have
-/// few nodes; a search of the tree looks at everything that hangs on them as well.
+/// Maps exact names to the nodes of a tree, for several look-ups while the tree does not change. Skeletons
+/// have few nodes, while a search of the tree also visits everything attached to them.
 class CNodeNames
 {
 public:
     explicit CNodeNames(CNode& root) : m_kNodes(NodesOf(root)) {}
 
-    /// What FindNode returns.
+    /// Returns the same as FindNode.
     CNode* Find(std::string_view name) const
     {
         const auto has = [=](const CNode* node) { return node->GetName() && node->NameView() == name; };
