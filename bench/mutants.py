@@ -3,13 +3,17 @@
 
     bench/mutants.py [--list bench/mutants.txt] [--copy build/mutants] [--jobs N] [WORD]
 
-A line of the list is: folder | file | text as it is | text with the fault. The text must be in the file exactly once.
-For each line, the folder's test program is built and run until its first failure. With a WORD, only lines that contain
-it are used. The copy is a git worktree of the current commit with its own build, and is kept for the next run.
+A line of the list is: tests | file | text as it is | text with the fault. The text must be in the file exactly once; where
+it is there more often, the file is given as NAME:LINE and the occurrence nearest to that line counts. The tests are names
+of folders with commas in between ("motion,app"), or of a script of the shell program ("cli.many"). Only what they need
+is built, and each runs until its first failure; they must pass without a fault. With a WORD, only lines that contain it
+are used. The copy is a git worktree of the current commit with its own build, and is kept for the next run.
 GAITWRIGHT_TEST_DATA is passed on. The exit code is 1 if a fault survives.
 """
 import argparse
 import os
+import re
+import signal
 import subprocess
 import sys
 from pathlib import Path
@@ -19,12 +23,12 @@ SECONDS = 300  # a fault that hangs is found
 
 
 def faults(path, word):
-    """Number of the line, folder, file, text and fault."""
+    """Number of the line, tests, file, text and fault."""
     for number, line in enumerate(path.read_text().splitlines(), 1):
         if line.strip() and not line.startswith("#") and word in line:
-            fields = [field.strip() for field in line.split(" | ")]
+            fields = [field.strip().replace("\\|", "|") for field in line.split(" | ")]
             if len(fields) != 4:
-                sys.exit("%s:%d: four fields are needed, with \" | \" in between" % (path, number))
+                sys.exit("%s:%d: four fields are needed, with \" | \" in between (\\| within one)" % (path, number))
             yield (number, *fields)
 
 
@@ -48,20 +52,44 @@ def prepare(copy):
         sys.exit("%s: no copy could be made here" % copy)
 
 
-def outcome(copy, folder, name, text, fault, jobs):
+def position(source, text, line):
+    """Where a text is in a source: the only place, or the one nearest to a line; -1 if that is no place."""
+    places = [match.start() for match in re.finditer(re.escape(text), source)]
+    if line and places:
+        return min(places, key=lambda place: abs(source.count("\n", 0, place) + 1 - int(line)))
+    return places[0] if len(places) == 1 else -1
+
+
+def passes(copy, tests, jobs):
+    """Whether tests pass; None if they cannot be built."""
+    script = tests.startswith("cli.")
+    target = "gaitwright" if script else tests + "_tests"
+    if not run(["ninja", "-j", str(jobs), "-C", "build/release", target], copy):
+        return None
+    if script:
+        return run(["ctest", "--test-dir", "build/release", "-R", "^%s$" % re.escape(tests)], copy, SECONDS)
+    return run([copy / "build/release/bin" / target, "--gtest_fail_fast"], copy, SECONDS)
+
+
+def outcome(copy, tests, name, text, fault, jobs):
     """What becomes of one fault: found, survives, or why it was not tried."""
-    path, target = copy / name, folder + "_tests"
+    name, _, line = name.partition(":")
+    path = copy / name
     source = path.read_text() if path.exists() else ""
-    if source.count(text) != 1:
+    place = position(source, text, line)
+    if place < 0:
         return "not planted: the text is there %d times" % source.count(text)
     try:
-        path.write_text(source.replace(text, fault))
-        if not run(["ninja", "-j", str(jobs), "-C", "build/release", target], copy):
-            return "does not build"
-        found = not run([copy / "build/release/bin" / target, "--gtest_fail_fast"], copy, SECONDS)
-        return "found" if found else "SURVIVES"
+        path.write_text(source[:place] + fault + source[place + len(text):])
+        for folder in tests.split(","):
+            passed = passes(copy, folder, jobs)
+            if passed is None:
+                return "does not build"
+            if not passed:
+                return "found"
+        return "SURVIVES"
     finally:
-        path.write_text(source) if source else None
+        path.write_text(source)
 
 
 def main():
@@ -71,10 +99,16 @@ def main():
     parser.add_argument("--jobs", type=int, default=os.cpu_count() or 1)
     parser.add_argument("word", nargs="?", default="", metavar="WORD")
     arguments = parser.parse_args()
+    # A shell ignores interrupts for what it starts in the background; tests of interrupts need them.
+    signal.signal(signal.SIGINT, signal.default_int_handler)
     prepare(arguments.copy)
+    listed = list(faults(arguments.list, arguments.word))
+    for tests in sorted({tests for fields in listed for tests in fields[1].split(",")}):
+        if not passes(arguments.copy, tests, arguments.jobs):
+            sys.exit("%s: these tests fail without a fault" % tests)
     counts = {}
-    for number, folder, name, text, fault in faults(arguments.list, arguments.word):
-        told = outcome(arguments.copy, folder, name, text, fault, arguments.jobs)
+    for number, tests, name, text, fault in listed:
+        told = outcome(arguments.copy, tests, name, text, fault, arguments.jobs)
         counts[told.split(":")[0]] = counts.get(told.split(":")[0], 0) + 1
         print("%3d %s: %s -> %s: %s" % (number, name, text, fault, told), flush=True)
     print(", ".join("%d %s" % (count, told) for told, count in counts.items()))
