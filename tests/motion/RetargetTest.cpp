@@ -16,6 +16,7 @@
 #include <gtest/gtest.h>
 #include <random>
 #include <string>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -206,25 +207,31 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
     }
 }
 
-// A turn about X is the last of the three that a rotation is taken apart into, of which bones take plain
-// shares, but for quaternions that are not normalised.
+// Two bones take a turn about one axis: the first of the three that it is taken apart into goes by the sine
+// of a share, the last by the other share, as quaternions that are not normalised on the way. The degrees
+// were worked out apart from the program, in the plane of the turn.
 TEST_F(CRetargeterTest, SharesAreInProportionToTheirWeights)
 {
+    const std::tuple<CBoneShares, Vec3, double> rows[] = {
+        {{1, 1, 1}, {40, 0, 0}, 20.0  },
+        {{3, 1, 1}, {40, 0, 0}, 30.868},
+        {{1, 3, 1}, {40, 0, 0}, 20.0  },
+        {{0, 0, 1}, {40, 0, 0}, 0.0   },
+        {{1, 1, 1}, {0, 40, 0}, 23.681},
+        {{3, 1, 1}, {0, 40, 0}, 22.197},
+        {{1, 3, 1}, {0, 40, 0}, 35.369},
+    };
     for (CNode* node : NodesOf(*m_kSource))
         TrackOf(*node).m_kRotationKeys.assign(10, kQuatIdentity);
-    TrackOf(*Source("Chest")).m_kRotationKeys.assign(10, QuatFromMat3(EulerToMat3("ZYX", {40, 0, 0})));
-    for (const auto& [weight, degrees] : {
-             std::pair{1.0f, 20.0f},
-             {3.0f, 30.0f},
-             {0.0f, 0.0f }
-    })
+    for (const auto& [shares, turn, degrees] : rows)
     {
-        m_kRetargeter.SetShares(Target("Waist"), {weight, weight, 1});
+        TrackOf(*Source("Chest")).m_kRotationKeys.assign(10, QuatFromMat3(EulerToMat3("ZYX", turn)));
+        m_kRetargeter.SetShares(Target("Waist"), shares);
         m_kRetargeter.SetShares(Target("UpperTorso"), {1, 1, 1});
         ASSERT_TRUE(Run(false));
         Pose(4);
-        EXPECT_LT(DegreesBetween(Target("Waist")->m_kMatrix, EulerToMat3("ZYX", {degrees, 0, 0})), 0.3)
-            << weight;
+        EXPECT_NEAR(DegreesBetween(Target("Waist")->m_kMatrix, kMat3Identity), degrees, 0.002)
+            << shares.m_fShare1 << ' ' << shares.m_fShare2 << ' ' << turn.y;
     }
 }
 
