@@ -5,6 +5,8 @@
 
 #include "CProfileEditorDialog.h"
 
+#include <tuple>
+
 namespace gw {
 
 using Calls = std::vector<std::string>;
@@ -13,12 +15,7 @@ TEST_F(ContentTest, Clicks)
 {
     m_kWindow.m_kAnswers[171] = EAnswer::Cancel;
     OpenAndConvert();
-    const struct
-    {
-        const char* child;
-        Calls calls;
-        bool passedOn;
-    } rows[] = {
+    const std::tuple<const char*, Calls, bool> rows[] = {
         {"close",    {"close"},          false},
         {"EXIT",     {"close"},          false},
         {"play",     {"timer 0 17"},     true },
@@ -28,12 +25,12 @@ TEST_F(ContentTest, Clicks)
         {"apply",    {"save *.Kinetra"}, true },
         {"nothing",  {},                 true },
     };
-    for (const auto& row : rows)
+    for (const auto& [child, calls, passedOn] : rows)
     {
-        SCOPED_TRACE(row.child);
+        SCOPED_TRACE(child);
         m_kWindow.TakeCalls();
-        EXPECT_EQ(m_kContent.ChildClick(row.child), row.passedOn);
-        EXPECT_EQ(m_kWindow.TakeCalls(), row.calls);
+        EXPECT_EQ(m_kContent.ChildClick(child), passedOn);
+        EXPECT_EQ(m_kWindow.TakeCalls(), calls);
     }
 }
 

@@ -11,6 +11,7 @@
 #include <cstdlib>
 #include <gtest/gtest.h>
 #include <map>
+#include <tuple>
 
 namespace gw {
 
@@ -51,13 +52,7 @@ TEST(IniText, Values)
 
 TEST(IniText, SettingKeepsEveryOtherLine)
 {
-    const struct
-    {
-        const char* what;
-        const char* before;
-        const char* value;
-        const char* after;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
         {"an empty file", "",                                "v",       "[Settings]\nK=v\n"                   },
         {"replaced",      "[Settings]\nJ=1\nK=old\nL=2\n",   "v",       "[Settings]\nJ=1\nK=v\nL=2\n"         },
         {"appended",      "[Settings]\nJ=1 ; c\n\n[B]\nK=2", "v",       "[Settings]\nJ=1 ; c\nK=v\n\n[B]\nK=2"},
@@ -67,11 +62,11 @@ TEST(IniText, SettingKeepsEveryOtherLine)
         {"a backslash",   "[Settings]\n\\",                  "v",       "[Settings]\n\\\n\nK=v"               },
         {"escaped",       "",                                "@C:\\\"", "[Settings]\nK=@@C:\\\\\\\"\n"        },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, before, value, after] : rows)
     {
-        const std::string text = SetIniValue(row.before, "Settings", "K", row.value);
-        EXPECT_EQ(text, row.after) << row.what;
-        EXPECT_EQ(FindIniValue(text, "Settings", "K"), row.value) << row.what;
+        const std::string text = SetIniValue(before, "Settings", "K", value);
+        EXPECT_EQ(text, after) << what;
+        EXPECT_EQ(FindIniValue(text, "Settings", "K"), value) << what;
     }
 }
 
@@ -143,32 +138,23 @@ TEST_F(FilePlatform, TheNearerFileCounts)
 TEST_F(FilePlatform, Documents)
 {
     const std::string home = m_kFolder.Path("home");
-    const struct
-    {
-        const char* what;
-        std::string line;
-        std::string folder;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string> rows[] = {
         {"none named",      "XDG_MUSIC_DIR=\"$HOME/Music\"\n",       home + "/Documents"},
         {"below the home",  "XDG_DOCUMENTS_DIR=\"$HOME/Papiere\"\n", home + "/Papiere"  },
         {"somewhere else",  " XDG_DOCUMENTS_DIR=\"/srv/docs\"\n",    "/srv/docs"        },
         {"a relative path", "XDG_DOCUMENTS_DIR=\"docs\"\n",          home + "/Documents"},
         {"commented out",   "#XDG_DOCUMENTS_DIR=\"/srv\"\n",         home + "/Documents"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, line, folder] : rows)
     {
-        Write("home/.config/user-dirs.dirs", row.line);
-        EXPECT_EQ(CFilePlatform(EPlatformWriting::No).DocumentsFolder(), row.folder) << row.what;
+        Write("home/.config/user-dirs.dirs", line);
+        EXPECT_EQ(CFilePlatform(EPlatformWriting::No).DocumentsFolder(), folder) << what;
     }
 }
 
 TEST_F(FilePlatform, LanguageOfTheEnvironment)
 {
-    const struct
-    {
-        const char* name;
-        const char* code;
-    } rows[] = {
+    const std::tuple<const char*, const char*> rows[] = {
         {"de_AT.UTF-8", "deu"},
         {"es",          "esn"},
         {"fr_CA",       "fra"},
@@ -185,10 +171,10 @@ TEST_F(FilePlatform, LanguageOfTheEnvironment)
         {"",            "enu"},
     };
     Set("LANG", "fr_FR");
-    for (const auto& row : rows)
+    for (const auto& [name, code] : rows)
     {
-        Set("LC_ALL", *row.name ? row.name : "C");
-        EXPECT_EQ(LanguageCode(CFilePlatform(EPlatformWriting::No).ThreadLocale()), row.code) << row.name;
+        Set("LC_ALL", *name ? name : "C");
+        EXPECT_EQ(LanguageCode(CFilePlatform(EPlatformWriting::No).ThreadLocale()), code) << name;
     }
 }
 
@@ -196,11 +182,7 @@ TEST(WindowPlacement, Texts)
 {
     const WindowPlacement placement{0, 1, -1, -1, -1, -1, 100, -50, 740, 480};
     EXPECT_EQ(PlacementText(placement), "0,1,-1,-1,-1,-1,100,-50,740,480");
-    const struct
-    {
-        const char* text;
-        bool scans;
-    } rows[] = {
+    const std::tuple<const char*, bool> rows[] = {
         {"0,1,-1,-1,-1,-1,100,-50,740,480",   true },
         {"0, 1, -1,-1,-1,-1,100,-50,740,480", true },
         {"2,1,-1,-1,-1,-1,100,-50,740",       false},
@@ -214,11 +196,11 @@ TEST(WindowPlacement, Texts)
         {"0 1 -1 -1 -1 -1 100 -50 740 480",   false},
         {"",                                  false},
     };
-    for (const auto& row : rows)
+    for (const auto& [text, scans] : rows)
     {
         WindowPlacement scanned;
-        EXPECT_EQ(ScanPlacement(row.text, scanned), row.scans) << row.text;
-        EXPECT_EQ(scanned, row.scans ? placement : WindowPlacement()) << row.text;
+        EXPECT_EQ(ScanPlacement(text, scanned), scans) << text;
+        EXPECT_EQ(scanned, scans ? placement : WindowPlacement()) << text;
     }
 }
 

@@ -3,6 +3,8 @@
 #include "CProfileEditorDialog.h"
 #include "Paths.h"
 
+#include <tuple>
+
 namespace gw {
 
 namespace {
@@ -29,21 +31,16 @@ TEST_F(ContentTest, TheListHoldsStockProfilesThenCustomOnes)
 TEST_F(ContentTest, PathsByDisplayName)
 {
     Write("docs/BVH Profile/Custom1.prf", "poser\n"); // hidden by the stock profile of that name
-    const struct
-    {
-        const char* what;
-        const char* name;
-        std::string path;
-    } rows[] = {
+    const std::tuple<const char*, const char*, std::string> rows[] = {
         {"a stock profile",        "Poser",  "data/PoserBVH.prf"           },
         {"case does not matter",   "POSER",  "data/PoserBVH.prf"           },
         {"a custom profile",       "mine",   "docs/BVH Profile/Custom0.prf"},
         {"a name that nobody has", "Nobody", ""                            },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, name, path] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(m_kContent.FindProfilePath(row.name), row.path.empty() ? "" : m_kFolder.Path(row.path));
+        SCOPED_TRACE(what);
+        EXPECT_EQ(m_kContent.FindProfilePath(name), path.empty() ? "" : m_kFolder.Path(path));
     }
 }
 
@@ -119,6 +116,15 @@ TEST_F(ContentTest, DeletingAProfile)
     EXPECT_FALSE(m_kWindow.m_kEnabled["del"]);
 }
 
+TEST_F(ContentTest, ADeletedNameThatWasListedOnceIsFreeAgain)
+{
+    m_kWindow.m_kList.SetCurSel(2); // choosing it would list it a second time
+    m_kContent.ChildClick("del");
+    m_kContent.ProfileEditor()->EditField(kNameField, "Mine");
+    m_kContent.ProfileEditor()->LeaveField();
+    EXPECT_EQ(SelectedProfile(), "Mine");
+}
+
 TEST_F(ContentTest, PruningPassesOverWhatSlidesIntoAPlace)
 {
     for (const char* name : {"gone 1", "gone 2", "gone 3"})
@@ -146,13 +152,7 @@ TEST_F(ContentTest, AnUnsavedNameStandsInTheListAndCannotBeDeleted)
 
 TEST_F(ContentTest, ListsKeepASelectionWhenEntriesGo)
 {
-    const struct
-    {
-        const char* what;
-        int selected;
-        int deleted;
-        int after;
-    } rows[] = {
+    const std::tuple<const char*, int, int, int> rows[] = {
         {"one before it",    2, 0,  1 },
         {"one behind it",    0, 2,  0 },
         {"itself",           1, 1,  1 },
@@ -160,14 +160,14 @@ TEST_F(ContentTest, ListsKeepASelectionWhenEntriesGo)
         {"all",              1, -1, -1},
         {"none there",       1, 7,  1 },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, selected, deleted, after] : rows)
     {
         CProfileList list;
         for (const char* name : {"a", "b", "c"})
             list.AddItem(name, 0);
-        list.SetCurSel(row.selected);
-        list.DeleteItem(row.deleted);
-        EXPECT_EQ(list.GetCurSel(), row.after) << row.what;
+        list.SetCurSel(selected);
+        list.DeleteItem(deleted);
+        EXPECT_EQ(list.GetCurSel(), after) << what;
     }
 }
 

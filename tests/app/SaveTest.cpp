@@ -8,6 +8,7 @@
 
 #include <cstring>
 #include <sys/stat.h>
+#include <tuple>
 
 namespace gw {
 
@@ -88,28 +89,24 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
     OpenAndConvert();
     const std::string path = Write("old.Kinetra", "old");
     chmod(path.c_str(), 0444);
-    const struct
-    {
-        const char* what;
-        const char* name;
-        const char* next; // step, which ends what the title says
-    } rows[] = {
+    // next: step, which ends what the title says
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"a read-only package",        "old.Kinetra",      "click convert"},
         {"a folder that is not there", "none/out.Kinetra", "open gone.bvh"},
         {"an HTR in such a folder",    "none/out.htr",     "open walk.bvh"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, name, next] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(SaveAs(row.name), 1);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(SaveAs(name), 1);
         EXPECT_TRUE(m_kContent.IsSaved()) << "the flag goes as if it had been written";
         EXPECT_EQ(m_kWindow.TakeWords().find("write-error"), 0u);
         EXPECT_EQ(m_kWindow.m_kTitles.back().find("Gaitwright v2.0 - not saved: "), 0u)
             << m_kWindow.m_kTitles.back();
-        EXPECT_EQ(m_kWindow.m_kBoxes.back(), "Nothing was written.\n" + m_kFolder.Path(row.name) +
+        EXPECT_EQ(m_kWindow.m_kBoxes.back(), "Nothing was written.\n" + m_kFolder.Path(name) +
                                                  ": the file cannot be written (check free space and "
                                                  "permissions)\n\nShow the file in its folder?");
-        Do(row.next);
+        Do(next);
         EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
         m_kWindow.TakeCalls();
     }

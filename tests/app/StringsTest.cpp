@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 #include <random>
 #include <set>
+#include <tuple>
 
 namespace gw {
 
@@ -126,18 +127,14 @@ TEST(ResourceManager, AStarLeavesATextToTheProgram)
 TEST(StringTable, FormatsTakeNothingButTheirArguments)
 {
     const std::string arguments[] = {"2", "walk"};
-    const struct
-    {
-        const char* format;
-        const char* text;
-    } rows[] = {
+    const std::tuple<const char*, const char*> rows[] = {
         {"Batch Converting %d : %s", "Batch Converting 2 : walk"},
         {"%s%s%s%s",                 "2walk"                    },
         {"100% %n %5d",              "100% %n %5d"              },
         {"%",                        "%"                        },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(FormatText(row.format, arguments), row.text);
+    for (const auto& [format, text] : rows)
+        EXPECT_EQ(FormatText(format, arguments), text);
 }
 
 TEST(FailureWords, EveryReasonHasItsOwnCodeAndWords)
@@ -156,28 +153,22 @@ TEST(FailureWords, EveryReasonHasItsOwnCodeAndWords)
 
 TEST(FailureWords, AReportSaysWhereAndWhatToDo)
 {
-    const struct
-    {
-        const char* what;
-        const char* path;
-        CFailure failure;
-        const char* line;
-    } rows[] = {
+    const std::tuple<const char*, const char*, CFailure, const char*> rows[] = {
         {"a line",
          "a.bvh",   {EFailure::BlankLine, 12, "Frames:"},
          "a.bvh:12: expected this keyword, but found an empty line: \"Frames:\" (remove the empty line)"},
         {"a byte of a container",
          "a.orn",   {EFailure::UnknownClass, 381, "CSpoon"},
-         "a.orn: byte 381: the file contains an object of an unknown class: \"CSpoon\""     },
+         "a.orn: byte 381: the file contains an object of an unknown class: \"CSpoon\""                 },
         {"a name that would command a terminal",
          "\x1b[2J", {EFailure::TooDeep, 0, "\x1b[31m"},
-         "\\x1b[2J: bones or objects are nested too deeply: \"\\x1b[31m\""               },
+         "\\x1b[2J: bones or objects are nested too deeply: \"\\x1b[31m\""                              },
         {"the path is not said twice",
          "a.htr",   {EFailure::NotRegular, 0, "a.htr"},
-         "a.htr: this is a folder or a device, not a file"                                             },
+         "a.htr: this is a folder or a device, not a file"                                              },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(ReportLine(MakeReport(row.path, row.failure, false)), row.line) << row.what;
+    for (const auto& [what, path, failure, line] : rows)
+        EXPECT_EQ(ReportLine(MakeReport(path, failure, false)), line) << what;
 }
 
 } // namespace gw

@@ -3,6 +3,7 @@
 #include "ToolFixture.h"
 
 #include <regex>
+#include <tuple>
 
 namespace gw {
 
@@ -212,11 +213,7 @@ TEST_F(ToolTest, HostileMaps)
     std::string everyByte;
     for (int byte = 0; byte < 256; ++byte)
         everyByte += static_cast<char>(byte);
-    const struct
-    {
-        const char* what;
-        std::string bytes;
-    } rows[] = {
+    const std::tuple<const char*, std::string> rows[] = {
         {"nothing",                                      ""                                           },
         {"empty lines",                                  std::string(1000,                              '\n')},
         {"one long line",                                              std::string(200'000,                                                                             'x')},
@@ -229,10 +226,10 @@ TEST_F(ToolTest, HostileMaps)
         {"keywords alone",                                   "Position\n<--->\n*\nFrameRate\n"                                },
     };
     LoadSource();
-    for (const auto& row : rows)
+    for (const auto& [what, bytes] : rows)
     {
-        SCOPED_TRACE(row.what);
-        Write("hostile.txt", row.bytes);
+        SCOPED_TRACE(what);
+        Write("hostile.txt", bytes);
         Click(kToolLoadMap, "hostile.txt");
         m_kToolWindow.onEdit = [](MapLine&) {};
         for (int line = 0; line < 5; ++line)
