@@ -3,6 +3,7 @@
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -137,12 +138,7 @@ TEST(Mat4, TheInverseIsGeneralAndLeavesItsOutputWhereItFails)
 
 TEST(Mat4, CoordinatesAreDividedUnlessTheFourthIsOne)
 {
-    const struct
-    {
-        const char* what;
-        float w;
-        float x;
-    } rows[] = {
+    const std::tuple<const char*, float, float> rows[] = {
         {"one",                                        1.0f,            3.0f    },
         {"one within the tolerance, its end included", 1.0f + kEpsilon, 3.0f    },
         {"one, from below",                            1.0f - kEpsilon, 3.0f    },
@@ -150,13 +146,13 @@ TEST(Mat4, CoordinatesAreDividedUnlessTheFourthIsOne)
         {"negative",                                   -1.0f,           -3.0f   },
         {"zero",                                       0.0f,            INFINITY},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, w, x] : rows)
     {
         Mat4 m = kMat4Identity;
-        m.m[15] = row.w;
+        m.m[15] = w;
         Vec3 v{3.0f, 0.0f, 0.0f};
         EXPECT_EQ(TransformCoord(&v, &v, &m), &v);
-        EXPECT_EQ(v.x, row.x) << row.what;
+        EXPECT_EQ(v.x, x) << what;
     }
     Vec3 v = kVec3One;
     EXPECT_EQ(TransformCoord(&v, &v, nullptr), nullptr);
