@@ -15,6 +15,7 @@
 #include <sys/resource.h>
 #include <sys/stat.h>
 #include <sys/wait.h>
+#include <tuple>
 
 namespace gw {
 
@@ -73,13 +74,7 @@ private:
 
 TEST(Paths, SplitIntoFolderStemAndExtension)
 {
-    const struct
-    {
-        const char* path;
-        const char* folder;
-        const char* stem;
-        const char* extension;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
         {"/a.b/walk.cut.bvh", "/a.b/",    "walk.cut", ".bvh"},
         {"C:\\in\\walk.BVH",  "C:\\in\\", "walk",     ".BVH"},
         {"a/b\\walk",         "a/b\\",    "walk",     ""    },
@@ -88,13 +83,13 @@ TEST(Paths, SplitIntoFolderStemAndExtension)
         {"a.b/",              "a.b/",     "",         ""    },
         {"",                  "",         "",         ""    },
     };
-    for (const auto& row : rows)
+    for (const auto& [path, folder, stem, extension] : rows)
     {
-        SCOPED_TRACE(row.path);
-        const PathParts parts = SplitPath(row.path);
-        EXPECT_EQ(parts.folder, row.folder);
-        EXPECT_EQ(parts.stem, row.stem);
-        EXPECT_EQ(parts.extension, row.extension);
+        SCOPED_TRACE(path);
+        const CPathParts parts = SplitPath(path);
+        EXPECT_EQ(parts.folder, folder);
+        EXPECT_EQ(parts.stem, stem);
+        EXPECT_EQ(parts.extension, extension);
     }
     EXPECT_TRUE(HasExtension("x.y/walk.BVH", ".bvh"));
     EXPECT_EQ(WithSeparator(""), "");
@@ -107,12 +102,7 @@ TEST(Paths, WhatIsThereIsToldApart)
     const std::string file = folder.Path("Läufer 走る.bvh");
     WriteBytes(file, "12345");
     const std::string endless(300, 'x');
-    const struct
-    {
-        const char* what;
-        std::string path;
-        bool isFile, isFolder, hasSize;
-    } rows[] = {
+    const std::tuple<const char*, std::string, bool, bool, bool> rows[] = {
         {"file",          file,                true,  false, true },
         {"folder",        folder.Path(),       false, true,  false},
         {"device",        "/dev/null",         true,  false, false},
@@ -121,15 +111,15 @@ TEST(Paths, WhatIsThereIsToldApart)
         {"name too long", endless,             false, false, false},
         {"no name",       "",                  false, false, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, path, isFile, isFolder, hasSize] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         uint64_t size = 99;
-        EXPECT_EQ(FileExists(row.path), row.isFile);
-        EXPECT_EQ(FolderExists(row.path), row.isFolder);
-        EXPECT_EQ(FileSize(row.path, size), row.hasSize);
-        EXPECT_EQ(size, row.hasSize ? 5u : 99u);
-        EXPECT_FALSE(IsReadOnly(row.path));
+        EXPECT_EQ(FileExists(path), isFile);
+        EXPECT_EQ(FolderExists(path), isFolder);
+        EXPECT_EQ(FileSize(path, size), hasSize);
+        EXPECT_EQ(size, hasSize ? 5u : 99u);
+        EXPECT_FALSE(IsReadOnly(path));
     }
     // Also for root, who may write it all the same.
     fs::permissions(file, fs::perms::owner_read | fs::perms::group_read);
@@ -174,13 +164,7 @@ TEST(CMappedFile, MapsRegularFilesOnly)
     WriteBytes(folder.Path("full"), "HIERARCHY");
     WriteBytes(folder.Path("empty"), "");
     ASSERT_EQ(mkfifo(folder.Path("pipe").c_str(), 0600), 0);
-    const struct
-    {
-        const char* what;
-        std::string path;
-        EFailure failure;
-        const char* text;
-    } rows[] = {
+    const std::tuple<const char*, std::string, EFailure, const char*> rows[] = {
         {"file",             folder.Path("full"),  EFailure::None,       "HIERARCHY"},
         {"empty file",       folder.Path("empty"), EFailure::None,       ""         },
         {"nothing there",    folder.Path("none"),  EFailure::NotFound,   ""         },
@@ -188,13 +172,13 @@ TEST(CMappedFile, MapsRegularFilesOnly)
         {"device",           "/dev/zero",          EFailure::NotRegular, ""         },
         {"pipe, not waited", folder.Path("pipe"),  EFailure::NotRegular, ""         },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, path, failure, text] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         CMappedFile file;
         ASSERT_EQ(file.Open(folder.Path("full")), EFailure::None); // which is replaced in every case
-        EXPECT_EQ(file.Open(row.path), row.failure);
-        EXPECT_EQ(file.Text(), row.text);
+        EXPECT_EQ(file.Open(path), failure);
+        EXPECT_EQ(file.Text(), text);
         EXPECT_EQ(file.Bytes().size(), file.Text().size());
     }
 }
@@ -359,11 +343,7 @@ TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
     fs::create_symlink("ring", folder.Path("ring"));
     fs::create_directory(folder.Path("folder"));
     const size_t before = EntryCount(folder);
-    const struct
-    {
-        const char* what;
-        std::string path;
-    } rows[] = {
+    const std::tuple<const char*, std::string> rows[] = {
         {"read-only file",        folder.Path("readonly")},
         {"link to it",            folder.Path("link")    },
         {"folder",                folder.Path("folder")  },
@@ -373,11 +353,11 @@ TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
         {"links in a ring",       folder.Path("ring")    },
         {"no name",               ""                     },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, path] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         CSafeFile file;
-        EXPECT_FALSE(file.Open(row.path));
+        EXPECT_FALSE(file.Open(path));
         EXPECT_FALSE(file.Write("new"));
         EXPECT_FALSE(file.Commit());
     }

@@ -4,6 +4,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -30,12 +31,7 @@ std::string Lines(std::string_view text)
 
 TEST(Text, TokensAreCutAtRunsOfDelimiters)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* tokens;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"nothing",                   "",                     ""                    },
         {"delimiters only",           " ,\t\n",               ""                    },
         {"a comma is a blank",        "1,2 3",                "1|2|3|"              },
@@ -43,8 +39,8 @@ TEST(Text, TokensAreCutAtRunsOfDelimiters)
         {"a carriage return is none", "a\rb c\r",             "a\rb|c\r|"           },
         {"bytes above 127 are none",  "H\xc3\xbc \xff ,\x80", "H\xc3\xbc|\xff|\x80|"},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(Tokens(row.text), row.tokens) << row.what;
+    for (const auto& [what, text, tokens] : rows)
+        EXPECT_EQ(Tokens(text), tokens) << what;
 
     std::string_view rest = "a:b,c \r\n d";
     EXPECT_EQ(NextToken(rest, ":"), "a");
@@ -55,20 +51,15 @@ TEST(Text, TokensAreCutAtRunsOfDelimiters)
 
 TEST(Text, LinesEndAtLineFeedsWithOrWithoutCarriageReturn)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* lines;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"nothing",                  "",              ""           },
         {"LF and CR LF",             "a\nb\r\nc\n",   "a|b|c|"     },
         {"empty lines",              "\n\r\n\n",      "|||"        },
         {"no end at the last line",  "a\nb",          "a|b|"       },
         {"a lone CR is a character", "a\rb\r\r\nc\r", "a\rb\r|c\r|"},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(Lines(row.text), row.lines) << row.what;
+    for (const auto& [what, text, lines] : rows)
+        EXPECT_EQ(Lines(text), lines) << what;
 }
 
 TEST(Text, NamesCompareWithoutTheCaseOfAsciiOnly)
@@ -91,12 +82,7 @@ TEST(Text, BlanksAndMarksGoFromTheEndsOnly)
 
 TEST(Text, PrintableTextCommandsNoTerminal)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* printed;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"plain",                    "Hips 1",           "Hips 1"              },
         {"letters beyond ASCII",     "Hüfte 腰 🦴",  "Hüfte 腰 🦴"     },
         {"escape sequence",          "\x1b[2J\x07\x7f",  "\\x1b[2J\\x07\\x7f"  },
@@ -111,19 +97,14 @@ TEST(Text, PrintableTextCommandsNoTerminal)
         {"half of a surrogate pair", "\xed\xa0\x80",     "\\xed\\xa0\\x80"     },
         {"no code point",            "\xf4\x90\x80\x80", "\\xf4\\x90\\x80\\x80"},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(Printable(row.text), row.printed) << row.what;
+    for (const auto& [what, text, printed] : rows)
+        EXPECT_EQ(Printable(text), printed) << what;
 }
 
 TEST(Text, NearestNameIsASlipAwayOrNone)
 {
     const std::vector<std::string> bones = {"Hips", "Spine", "LeftUpLeg", "RightUpLeg", "LeftLeg"};
-    const struct
-    {
-        const char* what;
-        const char* name;
-        const char* nearest;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"case has no say",         "leftupleg", "LeftUpLeg"},
         {"a letter too many",       "Hipss",     "Hips"     },
         {"a letter changed",        "Spime",     "Spine"    },
@@ -132,8 +113,8 @@ TEST(Text, NearestNameIsASlipAwayOrNone)
         {"nothing",                 "",          ""         },
         {"short and all different", "x",         ""         },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(NearestName(row.name, bones), row.nearest) << row.what;
+    for (const auto& [what, name, nearest] : rows)
+        EXPECT_EQ(NearestName(name, bones), nearest) << what;
     const std::string endless(1000000, 'x'); // would take minutes
     EXPECT_EQ(NearestName(endless, {endless}), "");
 }
