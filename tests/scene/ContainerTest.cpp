@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <numeric>
+#include <tuple>
 
 namespace gw {
 
@@ -154,11 +155,8 @@ TEST(PackageMotion, ASourceThatIsNotThereIsRefusedAndATargetThatCannotBeIsTold)
 
 TEST(COrrinStream, HeadersAreRefusedByTheirRules)
 {
-    const struct
-    {
-        const char* text; // 20 characters and what follows
-        EFailure reason;
-    } rows[] = {
+    // text: 20 characters and what follows
+    const std::tuple<const char*, EFailure> rows[] = {
         {"TKOrrin Version 1.20",  EFailure::None      },
         {"TKOrrin Version 0.01",  EFailure::None      },
         {"TKOrrin Version 1. 2",  EFailure::None      },
@@ -171,17 +169,17 @@ TEST(COrrinStream, HeadersAreRefusedByTheirRules)
         {"TKOrrin Version 1.200", EFailure::BadHeader },
     };
     const CTempFolder folder;
-    for (const auto& row : rows)
+    for (const auto& [text, reason] : rows)
     {
-        SCOPED_TRACE(row.text);
+        SCOPED_TRACE(text);
         CSceneBytes bytes;
-        bytes.Raw(row.text).Byte(0).EmptyThumbnail();
+        bytes.Raw(text).Byte(0).EmptyThumbnail();
         WriteBytes(folder.Path("a.orn"), bytes.View());
         COrrinStream stream;
         stream.AddRoot(new CNode); // stays when the file is refused
-        EXPECT_EQ(stream.LoadFile(folder.Path("a.orn"), false), row.reason == EFailure::None);
-        EXPECT_EQ(stream.Record().Failure().reason, row.reason);
-        EXPECT_EQ(stream.GetRootCount(), row.reason == EFailure::None ? 0u : 1u);
+        EXPECT_EQ(stream.LoadFile(folder.Path("a.orn"), false), reason == EFailure::None);
+        EXPECT_EQ(stream.Record().Failure().reason, reason);
+        EXPECT_EQ(stream.GetRootCount(), reason == EFailure::None ? 0u : 1u);
     }
     for (const size_t size : {0u, 1u, 19u, 20u})
     {
@@ -243,12 +241,8 @@ TEST(COrrinStream, EveryClassComesBackAsItWas)
 
 TEST(COrrinStream, SizesAreThoseOfTheFormat)
 {
-    const struct
-    {
-        Ref<CObject> object;
-        uint64_t disk;
-        uint64_t memory; // 0 where no figure is fixed
-    } rows[] = {
+    // memory: 0 where no figure is fixed
+    const std::tuple<Ref<CObject>, uint64_t, uint64_t> rows[] = {
         {new CNode,                108, 212},
         {new CBillboardNode,       117, 212},
         {new CCamera,              170, 284},
@@ -259,16 +253,16 @@ TEST(COrrinStream, SizesAreThoseOfTheFormat)
         {new CKeyframeClipControl, 178, 0  },
         {new CKeyframeControl,     166, 0  },
     };
-    for (const auto& row : rows)
+    for (const auto& [object, disk, memory] : rows)
     {
-        SCOPED_TRACE(row.object->GetRTTI()->m_pcName);
-        EXPECT_EQ(row.object->GetDiskUsed(), row.disk);
-        EXPECT_TRUE(!row.memory || row.object->GetMemoryUsed() == row.memory);
-        row.object->SetName("four");
-        EXPECT_EQ(row.object->GetDiskUsed(), row.disk + 4);
+        SCOPED_TRACE(object->GetRTTI()->m_pcName);
+        EXPECT_EQ(object->GetDiskUsed(), disk);
+        EXPECT_TRUE(!memory || object->GetMemoryUsed() == memory);
+        object->SetName("four");
+        EXPECT_EQ(object->GetDiskUsed(), disk + 4);
         COrrinStream stream;
-        stream.AddRoot(row.object.Get());
-        EXPECT_EQ(SaveBytes(stream).size(), 58 + 14 + row.disk + 4);
+        stream.AddRoot(object.Get());
+        EXPECT_EQ(SaveBytes(stream).size(), 58 + 14 + disk + 4);
     }
     COrrinStream stream;
     stream.AddRoot(SampleGraph().Get());

@@ -16,9 +16,8 @@
 #include <filesystem>
 #include <limits>
 #include <set>
-#include <tuple>
-
 #include <sys/stat.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -305,13 +304,7 @@ TEST_F(HTMLDump, APageIsFollowedByThePagesInIt)
 
 TEST(HTMLText, NamesAreNoMarkupAndNoScript)
 {
-    const struct
-    {
-        const char* what;
-        std::string_view name;
-        std::string_view page;
-        std::string_view script;
-    } rows[] = {
+    const std::tuple<const char*, std::string_view, std::string_view, std::string_view> rows[] = {
         {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"              },
         {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\x22'"           },
         {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\x5c\\x22b\\x0d\\x0a"   },
@@ -326,11 +319,11 @@ TEST(HTMLText, NamesAreNoMarkupAndNoScript)
         {"beyond the last character",             "\xf4\x90\x80\x80",       "\xf4\x90\x80\x80",        "\\xf4\\x90\\x80\\x80"     },
         {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\\xe6\\x9d\\xb1\\xe6\\x9d"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, name, page, script] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(HTMLText(row.name), row.page);
-        EXPECT_EQ(HTMLScriptText(row.name), row.script);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(HTMLText(name), page);
+        EXPECT_EQ(HTMLScriptText(name), script);
     }
 }
 
@@ -338,11 +331,7 @@ TEST(HTMLText, FloatsWithoutEndAreWords)
 {
     constexpr float kInfinity = std::numeric_limits<float>::infinity();
     const float below = std::nextafter(FLT_MAX, 0.0f);
-    const struct
-    {
-        float value;
-        std::string_view text;
-    } rows[] = {
+    const std::tuple<float, std::string_view> rows[] = {
         {0.0f,       "0.000"                                       },
         {-1.0005f,   "-1.000"                                      },
         {FLT_MAX,    "INFINITY"                                    },
@@ -352,8 +341,8 @@ TEST(HTMLText, FloatsWithoutEndAreWords)
         {below,      "340282326356119256160033759537265639424.000" },
         {-below,     "-340282326356119256160033759537265639424.000"},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(HTMLText(row.value), row.text);
+    for (const auto& [value, text] : rows)
+        EXPECT_EQ(HTMLText(value), text);
     EXPECT_EQ(HTMLText(Vec3{kInfinity, 1, -0.0f}), "(inf, 1.000, -0.000)");
 }
 

@@ -2,6 +2,7 @@
 #include "SceneSamples.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -128,14 +129,7 @@ TEST(CObject, SearchGoesThroughAttachmentsBeforeChildrenAndTheFirstHitWins)
     root->AttachChild(twin);
     root->AttachControl(new CTestControl);
     root->AttachControl(clips);
-    const struct
-    {
-        const char* what;
-        const char* name;
-        const CRTTI* record;
-        bool derived;
-        CObject* found;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const CRTTI*, bool, CObject*> rows[] = {
         {"everything matches the object itself", nullptr, nullptr,                     false, root.Get()},
         {"name alone",                           "leg",   nullptr,                     false, clips     },
         {"name and exact class",                 "leg",   &CNode::ms_kRTTI,            false, leg       },
@@ -144,10 +138,10 @@ TEST(CObject, SearchGoesThroughAttachmentsBeforeChildrenAndTheFirstHitWins)
         {"case counts",                          "Leg",   nullptr,                     false, nullptr   },
         {"no name is not an empty name",         "",      nullptr,                     false, nullptr   },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, name, record, derived, found] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(root->FindObject(row.name, row.record, row.derived), row.found);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(root->FindObject(name, record, derived), found);
     }
     std::vector<CObject*> found;
     root->FindObjects(found, nullptr, &CNode::ms_kRTTI, false);

@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <tuple>
 
 namespace gw {
 
@@ -95,12 +96,7 @@ TEST(CNode, CopySkeletonLeavesAllButNodesBehind)
 
 TEST(CSpatial, TwoAnswersOfTransformControlsKeepTheOldWorldMatrix)
 {
-    const struct
-    {
-        const char* what;
-        std::vector<bool> answers;
-        bool fresh;
-    } rows[] = {
+    const std::tuple<const char*, std::vector<bool>, bool> rows[] = {
         {"no control",        {},                    true },
         {"one that rewrote",  {true},                true },
         {"none that rewrote", {false, false, false}, true },
@@ -108,15 +104,15 @@ TEST(CSpatial, TwoAnswersOfTransformControlsKeepTheOldWorldMatrix)
         {"two",               {true, true},          false},
         {"two of three",      {true, false, true},   false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, answers, fresh] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const Ref<CNode> node = new CNode;
-        for (const bool answer : row.answers)
+        for (const bool answer : answers)
             node->AttachControl(new CTestControl(answer));
         node->m_kMatrix = At(1, 2, 3);
         node->UpdateTransform(0.0f);
-        EXPECT_EQ(node->m_kWorldMatrix == At(1, 2, 3), row.fresh);
+        EXPECT_EQ(node->m_kWorldMatrix == At(1, 2, 3), fresh);
         for (CControl* control = node->GetControl(); control; control = control->GetNext())
             EXPECT_EQ(static_cast<CTestControl*>(control)->m_iTransforms, 1);
     }
@@ -125,13 +121,7 @@ TEST(CSpatial, TwoAnswersOfTransformControlsKeepTheOldWorldMatrix)
 TEST(BoundSphere, MergeGrowsJustAsFarAsItMust)
 {
     const BoundSphere unit{kVec3Zero, 1.0f};
-    const struct
-    {
-        const char* what;
-        BoundSphere a;
-        BoundSphere b;
-        BoundSphere merged;
-    } rows[] = {
+    const std::tuple<const char*, BoundSphere, BoundSphere, BoundSphere> rows[] = {
         {"side by side",                 unit,           {{4, 0, 0}, 1}, {{2, 0, 0}, 3}      },
         {"unequal",                      unit,           {{5, 0, 0}, 2}, {{3, 0, 0}, 4}      },
         {"around",                       {{0, 1, 0}, 5}, unit,           {{0, 1, 0}, 5}      },
@@ -139,13 +129,13 @@ TEST(BoundSphere, MergeGrowsJustAsFarAsItMust)
         {"equal",                        unit,           unit,           unit                },
         {"a point at the origin counts", {{0, 0, 6}, 1}, {kVec3Zero, 0}, {{0, 0, 3.5f}, 3.5f}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, a, b, merged] : rows)
     {
-        SCOPED_TRACE(row.what);
-        BoundSphere sphere = row.a;
-        sphere.Merge(row.b);
-        EXPECT_EQ(sphere.m_kCentre, row.merged.m_kCentre);
-        EXPECT_FLOAT_EQ(sphere.m_fRadius, row.merged.m_fRadius);
+        SCOPED_TRACE(what);
+        BoundSphere sphere = a;
+        sphere.Merge(b);
+        EXPECT_EQ(sphere.m_kCentre, merged.m_kCentre);
+        EXPECT_FLOAT_EQ(sphere.m_fRadius, merged.m_fRadius);
     }
     const Vec3 points[] = {
         {-1, 0, 0},

@@ -8,6 +8,7 @@
 #include <limits>
 #include <numbers>
 #include <random>
+#include <tuple>
 
 namespace gw {
 
@@ -386,11 +387,7 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
         {70, 4, 1},
         {80, 9, 1}
     });
-    const struct
-    {
-        const char* what;
-        float time, keyTime;
-    } rows[] = {
+    const std::tuple<const char*, float, float> rows[] = {
         {"idle before anything is scheduled", 1,             51            },
         {"idle loops",                        4.5f,          50.5f         },
         {"one frame early is in time",        5.0f - 0.016f, 10.0f - 0.016f},
@@ -406,10 +403,10 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
         {"before all time",                   -kInfinity,    50            },
         {"no number",                         kNaN,          3             },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, time, keyTime] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_NEAR(control->ClipTime(row.time), row.keyTime, 1e-5f);
+        SCOPED_TRACE(what);
+        EXPECT_NEAR(control->ClipTime(time), keyTime, 1e-5f);
     }
 }
 
