@@ -2,6 +2,7 @@
 #include "SceneSamples.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -32,25 +33,21 @@ TEST(Morph, MovesTheModelByTheWeightOfTheTime)
     const Ref<CTriMesh> mesh = PointMesh({kVec3Zero, kVec3UnitX});
     mesh->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitZ, 1.57079632f), {0, 0, 5});
     CMorphControl& morph = AttachMorph(*mesh, {kVec3UnitX}); // fewer deltas than points
-    const struct
-    {
-        const char* what;
-        float time, weight;
-    } rows[] = {
+    const std::tuple<const char*, float, float> rows[] = {
         {"before the first key", -1, 0   },
         {"between",              1,  0.5f},
         {"on a key",             4,  2   },
         {"back",                 6,  1   },
         {"behind the last",      9,  0   },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, time, weight] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const uint32_t stamp = mesh->m_uiChangeStamp;
-        mesh->UpdateScene(row.time, false);
-        ExpectPoint(mesh->WorldXYZBuffer()[0], {0, row.weight, 5});
+        mesh->UpdateScene(time, false);
+        ExpectPoint(mesh->WorldXYZBuffer()[0], {0, weight, 5});
         ExpectPoint(mesh->WorldXYZBuffer()[1], {0, 1, 5});
-        EXPECT_EQ(mesh->m_uiChangeStamp - stamp, row.weight == 0 ? 0u : 1u);
+        EXPECT_EQ(mesh->m_uiChangeStamp - stamp, weight == 0 ? 0u : 1u);
     }
     AttachMorph(*mesh, {kVec3UnitY, kVec3UnitY});
     mesh->UpdateScene(4.0f, false);

@@ -5,6 +5,7 @@
 #include <gtest/gtest.h>
 
 #include <algorithm>
+#include <tuple>
 
 namespace gw {
 
@@ -44,13 +45,7 @@ TEST(Shapes, AreHitWhereTheyStandInTheWorld)
         {2, 0, 0},
         {0, 0, 0}
     });
-    const struct
-    {
-        const char* what;
-        CShape* shape;
-        Vec3 place;
-        bool hit;
-    } rows[] = {
+    const std::tuple<const char*, CShape*, Vec3, bool> rows[] = {
         {"beside the line",       line.Get(),      {5, 4.9f, 100},  true },
         {"at the tolerance",      line.Get(),      {5, 5, 100},     false},
         {"beside its first end",  line.Get(),      {0, 1, 100},     false},
@@ -65,10 +60,10 @@ TEST(Shapes, AreHitWhereTheyStandInTheWorld)
         {"outside",               square.Get(),    {3, 1, 100},     false},
         {"the other way round",   clockwise.Get(), {1, 1, 100},     true },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, shape, place, hit] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(row.shape->HitTest(row.place), row.hit);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(shape->HitTest(place), hit);
     }
     Vec3 center;
     line->GetCenter(center);

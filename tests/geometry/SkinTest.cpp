@@ -2,6 +2,7 @@
 #include "SceneSamples.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -109,12 +110,7 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
     m_kMesh->SetPointCount(8);
     m_kMesh->UpdateScene(0.0f, false);
     CBoneSkinControl& skin = Attach<CBoneSkinControl>({});
-    const struct
-    {
-        CNode* bone;
-        uint32_t point;
-        float weight;
-    } influences[] = {
+    const std::tuple<CNode*, uint32_t, float> influences[] = {
         {m_kA.Get(), 6, 0.5f },
         {m_kA.Get(), 2, 0.25f},
         {m_kA.Get(), 3, 1.0f },
@@ -123,8 +119,8 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
         {m_kB.Get(), 4, 0.0f }, // acts on nothing
         {m_kB.Get(), 6, 3.0f },
     };
-    for (const auto& influence : influences)
-        skin.AddInfluence(*influence.bone, influence.point, influence.weight, kMat4Identity);
+    for (const auto& [bone, point, weight] : influences)
+        skin.AddInfluence(*bone, point, weight, kMat4Identity);
     skin.RebuildSkinTables();
     std::vector<uint32_t> points;
     for (const CSkinPointRecord& record : skin.Points())
