@@ -8,6 +8,7 @@
 #include <cstdio>
 #include <cstring>
 #include <gtest/gtest.h>
+#include <tuple>
 #include <unistd.h>
 #include <vector>
 
@@ -187,14 +188,7 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAFileInItsOrder)
 TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
 {
     // Rows asked for, and what comes, by the number that their pixels are made of; 0 where none comes.
-    const struct
-    {
-        const char* what;
-        int height;
-        bool pipe;
-        std::string_view order;
-        std::string_view rows;
-    } cases[] = {
+    const std::tuple<const char*, int, bool, std::string_view, std::string_view> cases[] = {
         {"a file, bottom up",  3,  false, "012",  "321" },
         {"a file, top down",   -3, false, "012",  "123" },
         {"a file, back again", -3, false, "20",   "31"  },
@@ -203,22 +197,22 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
         {"a pipe, and back",   -3, true,  "101",  "202" },
         {"a pipe, in pieces",  3,  true,  "2200", "1133"},
     };
-    for (const auto& row : cases)
+    for (const auto& [what, height, pipe, order, rows] : cases)
     {
-        SCOPED_TRACE(row.what);
-        WriteBytes(Path(), MadeBMP{1, row.height, 24, {}, kThreeRows, 0, 40, 5}.Bytes());
-        const StandardInput input(Path(), row.pipe);
+        SCOPED_TRACE(what);
+        WriteBytes(Path(), MadeBMP{1, height, 24, {}, kThreeRows, 0, 40, 5}.Bytes());
+        const StandardInput input(Path(), pipe);
         const auto picture = OpenPicture("-.bmp", "r");
         ASSERT_TRUE(picture);
         EXPECT_FALSE(picture->IsBottomFirst());
         std::string found;
-        for (const char y : row.order)
+        for (const char y : order)
         {
             PixelRGBA pixel{};
             picture->ReadRowRGBA(y - '0', 0, 1, &pixel);
             found += static_cast<char>('0' + pixel.g);
         }
-        EXPECT_EQ(found, row.rows);
+        EXPECT_EQ(found, rows);
     }
 }
 
@@ -411,11 +405,7 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
     EXPECT_EQ(FindPictureType("a.Z")->magic, 0x1f9d);
     EXPECT_EQ(FindPictureType("a.z")->magic, 0x1f8b);
 
-    const struct
-    {
-        std::string_view bytes;
-        const char* extension;
-    } heads[] = {
+    const std::tuple<std::string_view, const char*> heads[] = {
         {"BM123",     "bmp" },
         {"\x50\x88",  "dump"},
         {"-\xcc\x52", "rle" },
@@ -423,10 +413,10 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
         {"\xcc\x52-", ""    },
         {"B",         ""    },
     };
-    for (const auto& row : heads)
+    for (const auto& [bytes, extension] : heads)
     {
-        const PicFileType* type = FindPictureTypeOfBytes(std::as_bytes(std::span(row.bytes)));
-        EXPECT_EQ(type ? type->extension : "", row.extension);
+        const PicFileType* type = FindPictureTypeOfBytes(std::as_bytes(std::span(bytes)));
+        EXPECT_EQ(type ? type->extension : "", extension);
     }
     EXPECT_TRUE(Open(MadeBMP{1, 1, 24, {}, "1234"}.Bytes(), "a.picture")) << "by its first bytes";
     EXPECT_FALSE(Open("P6 1 1 255 abc", "a.ppm")) << "a type without a driver";

@@ -6,6 +6,7 @@
 #include <gtest/gtest.h>
 #include <limits>
 #include <string>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -88,12 +89,7 @@ TEST(CFilter, PolynomialKernelsAddUpToOne)
 
 TEST(CFilter, HaveKnownValues)
 {
-    const struct
-    {
-        std::string_view name;
-        double x;
-        double value;
-    } rows[] = {
+    const std::tuple<std::string_view, double, double> rows[] = {
         {"box",       -0.5, 1.0               },
         {"box",       0.5,  0.0               },
         {"triangle",  -1.0, 0.0               },
@@ -122,8 +118,8 @@ TEST(CFilter, HaveKnownValues)
         {"hamming",   1.0,  0.08              },
         {"blackman",  0.5,  0.34              },
     };
-    for (const auto& row : rows)
-        EXPECT_NEAR((*FindFilter(row.name))(row.x), row.value, 1e-10) << row.name << " " << row.x;
+    for (const auto& [name, x, value] : rows)
+        EXPECT_NEAR((*FindFilter(name))(x), value, 1e-10) << name << " " << x;
 }
 
 // Two corners of its family are other filters, so that all seven coefficients have something to agree with.

@@ -9,18 +9,14 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <tuple>
 
 namespace gw {
 
 TEST(PictureFiles, FormatsKeepPixelsAndResolution)
 {
-    const struct
-    {
-        const char* name;
-        int32_t format;
-        int tolerance;
-        int32_t resolution; // 96 where the format keeps none
-    } rows[] = {
+    // resolution: 96 where the format keeps none
+    const std::tuple<const char*, int32_t, int, int32_t> rows[] = {
         {"a.png",  0, 0, 300},
         {"a.PNG",  1, 0, 300},
         {"a.bmp",  0, 0, 300},
@@ -33,16 +29,16 @@ TEST(PictureFiles, FormatsKeepPixelsAndResolution)
         {"a.ppm",  1, 0, 96 },
     };
     const CTempFolder folder;
-    for (const auto& row : rows)
+    for (const auto& [name, format, tolerance, resolution] : rows)
     {
-        SCOPED_TRACE(row.name);
-        const Ref<CImage> image = Halves(row.format);
+        SCOPED_TRACE(name);
+        const Ref<CImage> image = Halves(format);
         image->Pixels().SetResolution(72, 300);
-        ASSERT_TRUE(image->Save(folder.Path(row.name), 95));
+        ASSERT_TRUE(image->Save(folder.Path(name), 95));
         const Ref<CImage> again = new CImage;
-        ASSERT_TRUE(again->Load(folder.Path(row.name)));
-        EXPECT_TRUE(ShowsHalves(*again, row.tolerance));
-        EXPECT_NEAR(again->Pixels().Layout().m_iVerticalResolution, row.resolution, 1);
+        ASSERT_TRUE(again->Load(folder.Path(name)));
+        EXPECT_TRUE(ShowsHalves(*again, tolerance));
+        EXPECT_NEAR(again->Pixels().Layout().m_iVerticalResolution, resolution, 1);
     }
 }
 

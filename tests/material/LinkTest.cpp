@@ -10,6 +10,7 @@
 #include <gtest/gtest.h>
 
 #include <filesystem>
+#include <tuple>
 
 namespace gw {
 
@@ -64,11 +65,8 @@ TEST(LinkNames, LeadWhereTheRuleSays)
     const CTempFolder folder;
     const std::string there = folder.Path("there.png");
     WriteBytes(there, "x");
-    const struct
-    {
-        std::string name;
-        const char* path; // below the folder /scenes, or from the root
-    } rows[] = {
+    // path: below the folder /scenes, or from the root
+    const std::tuple<std::string, const char*> rows[] = {
         {"a.png",                      "a.png"     },
         {"textures\\a.png",            "a.png"     },
         {"textures/a.png",             "a.png"     },
@@ -85,10 +83,10 @@ TEST(LinkNames, LeadWhereTheRuleSays)
         {"x\\wood\\..\\..\\..\\a.png", "a.png"     },
         {"x\\wood\\..\\oak\\a.png",    "oak/a.png" },
     };
-    for (const auto& row : rows)
+    for (const auto& [name, path] : rows)
     {
-        EXPECT_EQ(ResolveLinkName("/scenes", row.name), std::string("/scenes/") + row.path) << row.name;
-        EXPECT_EQ(ResolveLinkName("", row.name), row.path) << row.name;
+        EXPECT_EQ(ResolveLinkName("/scenes", name), std::string("/scenes/") + path) << name;
+        EXPECT_EQ(ResolveLinkName("", name), path) << name;
     }
     EXPECT_EQ(ResolveLinkName("/scenes", there), there) << "a file from the root that is there";
     CreateFolder(folder.Path("x/deep"));
@@ -102,11 +100,7 @@ TEST(LinkNames, LeadWhereTheRuleSays)
 
 TEST(LinkNames, AreStoredSoThatTheyLeadBack)
 {
-    const struct
-    {
-        const char* path;
-        const char* stored;
-    } rows[] = {
+    const std::tuple<const char*, const char*> rows[] = {
         {"/scenes/a.png",          "a.png"                 },
         {"/scenes/wood/oak/a.png", ".\\wood\\oak\\a.png"   },
         {"/scenes/x/../a.png",     "a.png"                 },
@@ -117,8 +111,8 @@ TEST(LinkNames, AreStoredSoThatTheyLeadBack)
         {"\\\\server\\a.png",      "\\\\server\\a.png"     },
         {"/scenes/wood/12:30.png", "/scenes/wood/12:30.png"},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(StoredLinkName("/scenes", row.path), row.stored) << row.path;
+    for (const auto& [path, stored] : rows)
+        EXPECT_EQ(StoredLinkName("/scenes", path), stored) << path;
     const std::string here = std::filesystem::current_path().string();
     EXPECT_EQ(StoredLinkName("", "a.png"), "a.png");
     EXPECT_EQ(StoredLinkName("/scenes", "a.png"), here + "/a.png") << "elsewhere a short name would be lost";
