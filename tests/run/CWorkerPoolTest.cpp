@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <csignal>
 #include <gtest/gtest.h>
+#include <tuple>
 #include <unistd.h>
 
 namespace gw {
@@ -129,24 +130,19 @@ TEST(CWorkerPool, EndsComeInOrderAndFewProcessesDoManyJobs)
 
 TEST(CWorkerPool, ALostJobCostsItselfOnly)
 {
-    const struct
-    {
-        const char* what;
-        EDeed deed;
-        EKind kind;
-    } rows[] = {
+    const std::tuple<const char*, EDeed, EKind> rows[] = {
         {"a signal",    EDeed::Crash, EKind::Died    },
         {"a bare exit", EDeed::Exit,  EKind::Died    },
         {"no end",      EDeed::Hang,  EKind::TimedOut},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, deed, kind] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const CTempFolder folder;
-        CDeeds deeds(Deeds(12, 4, row.deed), folder);
+        CDeeds deeds(Deeds(12, 4, deed), folder);
         EXPECT_TRUE(RunDeeds(deeds, 12, 2, ECommit::AtOnce, 2.0));
         EXPECT_EQ(deeds.taken.size(), 12u);
-        EXPECT_EQ(deeds.kinds[4], row.kind);
+        EXPECT_EQ(deeds.kinds[4], kind);
         EXPECT_EQ(deeds.lost, std::vector<size_t>{4});
         EXPECT_EQ(deeds.good, 11u);
         EXPECT_EQ(ResultCount(folder, 12), 11u);

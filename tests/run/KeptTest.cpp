@@ -9,6 +9,7 @@
 
 #include <fstream>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -53,26 +54,20 @@ TEST(CContentHash, TellsApartWhichBytesBelongToWhat)
 TEST(CReportFile, HalfALineOfADeadWriterIsClosedFirst)
 {
     const CTempFolder folder;
-    const struct
-    {
-        const char* what;
-        const char* before;
-        CReportFile::EStart start;
-        const char* after;
-    } rows[] = {
+    const std::tuple<const char*, const char*, CReportFile::EStart, const char*> rows[] = {
         {"nothing there",  "",        CReportFile::EStart::AtEnd, "new\n"         },
         {"whole lines",    "old\n",   CReportFile::EStart::AtEnd, "old\nnew\n"    },
         {"half a line",    "old\nha", CReportFile::EStart::AtEnd, "old\nha\nnew\n"},
         {"to be replaced", "old\nha", CReportFile::EStart::Empty, "new\n"         },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, before, start, after] : rows)
     {
-        SCOPED_TRACE(row.what);
-        WriteText(folder.Path("report"), row.before);
+        SCOPED_TRACE(what);
+        WriteText(folder.Path("report"), before);
         CReportFile report;
-        ASSERT_TRUE(report.Open(folder.Path("report"), row.start));
+        ASSERT_TRUE(report.Open(folder.Path("report"), start));
         EXPECT_TRUE(report.AddLine("new"));
-        EXPECT_EQ(ReadText(folder.Path("report")), row.after); // at once, and not when it is closed
+        EXPECT_EQ(ReadText(folder.Path("report")), after); // at once, and not when it is closed
     }
     CReportFile full;
     EXPECT_FALSE(full.Open("/dev/full", CReportFile::EStart::Empty) && full.AddLine("lost"));
@@ -140,13 +135,7 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
 
 TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
 {
-    const struct
-    {
-        const char* what;
-        RunProgress progress;
-        size_t width;
-        const char* line;
-    } rows[] = {
+    const std::tuple<const char*, CProgress, size_t, const char*> rows[] = {
         {"nothing known", {0, 8, 0, 0.0},       80, "[>                       ] 0/8"                              },
         {"half",          {5, 10, 0, 2.5},      80, "[============>           ] 5/10  2.5/s  2s left"             },
         {"minutes",       {0, 10000, 0, 100.0}, 80, "[>                       ] 0/10000  100.0/s  1m40s left"     },
@@ -159,10 +148,10 @@ TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
          {0, 1000000, 0, 0.0001},
          80,                                        "[>                       ] 0/1000000  0.0/s  277777h46m left"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, progress, width, line] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(ProgressLine(row.progress, row.width), row.line);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(ProgressLine(progress, width), line);
     }
 }
 
