@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <gtest/gtest.h>
+#include <tuple>
 #include <utility>
 
 namespace gw {
@@ -129,13 +130,7 @@ TEST(FindBodyByNames, ABodyKeepsItsJointsWhateverIsDoneToItsNames)
 
 TEST(FindBodyByNames, WordsAreUnderstoodInTheirCompany)
 {
-    const struct
-    {
-        const char* what;
-        const char* tree;
-        EBodyJoint joint;
-        const char* name;
-    } rows[] = {
+    const std::tuple<const char*, const char*, EBodyJoint, const char*> rows[] = {
         {"a shoulder beside an arm is a clavicle",               "Hips(LeftShoulder(LeftArm(LeftForeArm)))",
          EBodyJoint::Clavicle,                                                                                                               "LeftShoulder"},
         {"a shoulder without one is the upper arm",              "Hips(LeftCollar(LeftShoulder(LeftElbow)))",
@@ -156,11 +151,11 @@ TEST(FindBodyByNames, WordsAreUnderstoodInTheirCompany)
         {"words of one letter more are others",                  "Hips(Handle(Headband) Legend Armature)",             EBodyJoint::Head,
          "(none)"                                                                                                                                          },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, tree, joint, name] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const Ref<CNode> root = Tree(row.tree);
-        EXPECT_EQ(NameOf(JointAt(FindBodyByNames(*root), {row.joint})), row.name);
+        SCOPED_TRACE(what);
+        const Ref<CNode> root = Tree(tree);
+        EXPECT_EQ(NameOf(JointAt(FindBodyByNames(*root), {joint})), name);
     }
 }
 
