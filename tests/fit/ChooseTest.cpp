@@ -7,6 +7,7 @@
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -198,12 +199,8 @@ TEST_F(Choose, RealMotions)
     const std::string folder = SharedDataFolder();
     if (folder.empty())
         GTEST_SKIP() << "no shared data here";
-    const struct
-    {
-        const char* file;
-        const char* name; ///< empty where nothing fits
-        ESureness sureness;
-    } rows[] = {
+    // name: empty where nothing fits
+    const std::tuple<const char*, const char*, ESureness> rows[] = {
         {"bandai_walk_normal_002", "Bandai Namco (2 spine joints)",                              ESureness::Sure  },
         {"cmu_cgspeed_example",    "CMU, MotionBuilder names (3 spine joints, fingers)",         ESureness::Sure  },
         {"daz3d_genesis",          "DAZ Genesis 3 and 8 (4 spine joints, fingers)",              ESureness::Sure  },
@@ -222,14 +219,14 @@ TEST_F(Choose, RealMotions)
         {"walk01_leftupleg",       "MotionBuilder / HumanIK (2 spine joints, leaning)",          ESureness::Sure  },
         {"xzy_leftupleg",          "MotionBuilder / HumanIK (4 spine joints)",                   ESureness::Likely},
     };
-    for (const auto& row : rows)
+    for (const auto& [file, name, sureness] : rows)
     {
-        SCOPED_TRACE(row.file);
+        SCOPED_TRACE(file);
         CMotionFile source;
-        ASSERT_TRUE(source.Load(folder + "bvh/" + row.file + ".bvh"));
+        ASSERT_TRUE(source.Load(folder + "bvh/" + file + ".bvh"));
         const ProfileChoice best = Of(*source.motionRoot).front();
-        EXPECT_EQ(best.match.IsWhole() ? best.profile.name : "", row.name);
-        EXPECT_EQ(best.verdict.sureness, row.sureness);
+        EXPECT_EQ(best.match.IsWhole() ? best.profile.name : "", name);
+        EXPECT_EQ(best.verdict.sureness, sureness);
     }
 }
 
@@ -239,11 +236,7 @@ TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
     const std::string folder = SharedDataFolder();
     if (folder.empty())
         GTEST_SKIP() << "no shared data here";
-    const struct
-    {
-        const char* file;
-        const char* profile;
-    } rows[] = {
+    const std::tuple<const char*, const char*> rows[] = {
         {"cmu1_jumping_jacks",    "MaxBVH.prf"  },
         {"mocapbank_lefthip",     "MaxBVH.prf"  },
         {"yxz_lefthip",           "MaxBVH.prf"  },
@@ -251,12 +244,12 @@ TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
         {"poser_pose1",           "PoserBVH.prf"},
         {"poser_tpose_one_frame", "PoserBVH.prf"},
     };
-    for (const auto& row : rows)
+    for (const auto& [file, profile] : rows)
     {
-        SCOPED_TRACE(row.file);
+        SCOPED_TRACE(file);
         CMotionFile source;
-        ASSERT_TRUE(source.Load(folder + "bvh/" + row.file + ".bvh"));
-        const ProfileChoice choice = Of(*source.motionRoot, {std::string(kAssets) + row.profile}).front();
+        ASSERT_TRUE(source.Load(folder + "bvh/" + file + ".bvh"));
+        const ProfileChoice choice = Of(*source.motionRoot, {std::string(kAssets) + profile}).front();
         EXPECT_TRUE(choice.match.IsWhole());
         for (const ProfileDoubt& doubt : choice.verdict.doubts)
             EXPECT_FALSE(IsOfRoles(doubt.kind)) << doubt.joint;
