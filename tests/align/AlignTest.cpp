@@ -12,6 +12,7 @@
 #include <algorithm>
 #include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -187,12 +188,7 @@ TEST(AlignMotion, LaysEveryLimbAlongItsAxisAtRest)
         SCOPED_TRACE(row.what);
         const CMadeBody told = Made(row);
         const AlignedMotion aligned = Align(told);
-        const struct
-        {
-            const char* from;
-            const char* to;
-            Vec3 axis;
-        } bones[] = {
+        const std::tuple<const char*, const char*, Vec3> bones[] = {
             {"LowerTorso", "Waist",     kVec3UnitY },
             {"UpperTorso", "Neck",      kVec3UnitY },
             {"Neck",       "Head",      kVec3UnitY },
@@ -206,11 +202,11 @@ TEST(AlignMotion, LaysEveryLimbAlongItsAxisAtRest)
             {"LCalf",      "LFoot",     -kVec3UnitY},
             {"RCalf",      "RFoot",     -kVec3UnitY},
         };
-        for (const auto& bone : bones)
+        for (const auto& [from, to, axis] : bones)
         {
-            const Vec3 way = RestWorld(*FindNode(aligned.root.Get(), bone.to)).Translation() -
-                             RestWorld(*FindNode(aligned.root.Get(), bone.from)).Translation();
-            EXPECT_LT(AngleBetween(way, bone.axis), 0.1) << bone.from;
+            const Vec3 way = RestWorld(*FindNode(aligned.root.Get(), to)).Translation() -
+                             RestWorld(*FindNode(aligned.root.Get(), from)).Translation();
+            EXPECT_LT(AngleBetween(way, axis), 0.1) << from;
         }
         const Vec3 toe = RestLocal(*FindNode(aligned.root.Get(), "RToe")).Translation();
         EXPECT_NEAR(toe.x, 0.0f, 0.1f) << "heads along +Z";
@@ -288,12 +284,7 @@ TEST(AlignMotion, KeepsPositionsThatVary)
 
 TEST(AlignMotion, WorksOnBodiesThatLackJointsAndOnSinglePoses)
 {
-    const struct
-    {
-        const char* what;
-        std::vector<std::string> without;
-        int frameCount;
-    } rows[] = {
+    const std::tuple<const char*, std::vector<std::string>, int> rows[] = {
         {"no hands",            {"LHand", "RHand"},                         40},
         {"no fingers",          {"LThumb", "LIndex", "LMiddle", "LLittle"}, 40},
         {"no toes",             {"LToe", "RToe"},                           40},
@@ -301,18 +292,18 @@ TEST(AlignMotion, WorksOnBodiesThatLackJointsAndOnSinglePoses)
         {"one pose",            {},                                         1 },
         {"no pose",             {},                                         0 },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, without, frameCount] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         Telling telling;
         telling.turn = ArmsDown(45.0);
-        telling.without = row.without;
-        telling.frameCount = row.frameCount;
+        telling.without = without;
+        telling.frameCount = frameCount;
         const CMadeBody told(telling);
         const AlignedMotion aligned = Align(told);
         EXPECT_LT(LargestDistance(WorldsAt(*told.Motion().root, told.Motion().frequency, 0),
                                   WorldsAt(*aligned.root, told.Motion().frequency, 0)),
-                  row.frameCount > 0 ? 0.001 : 100.0);
+                  frameCount > 0 ? 0.001 : 100.0);
         const Vec3 arm = RestLocal(*FindNode(aligned.root.Get(), "LForearm")).Translation();
         EXPECT_LT(AngleBetween(arm, kVec3UnitX), 0.1);
     }
