@@ -8,6 +8,7 @@
 #include <algorithm>
 #include <gtest/gtest.h>
 #include <random>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -74,23 +75,18 @@ TEST(DamagedFiles, WithBytesChangedAreAnswered)
 
 TEST(DamagedFiles, ThatHoldNoMotionAreTold)
 {
-    const struct
-    {
-        const char* what;
-        std::string text;
-        const char* found;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*> rows[] = {
         {"nothing",      "",                    "0 reader"                            },
         {"another text", "solid cube\nfacet\n", "2 reader"                            },
         {"bytes",        std::string(300,       '\x01'),                                "0 not-text"},
         {"a motion without hierarchy",              "MOTION\nFrames: 1\n0 0 0\n",        "1 reader"    },
         {"a hierarchy without joints",              "HIERARCHY\nMOTION\nFrames: 1\n",        "2 reader"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, found] : rows)
     {
-        SCOPED_TRACE(row.what);
-        CExamined examined(row.text);
-        EXPECT_EQ(examined.Found(), row.found);
+        SCOPED_TRACE(what);
+        CExamined examined(text);
+        EXPECT_EQ(examined.Found(), found);
         EXPECT_TRUE(examined.Exam().Findings().HasErrors());
     }
     CFileExam missing;

@@ -8,6 +8,7 @@
 #include "Skeleton.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -45,12 +46,7 @@ TEST(PoseFaults, AreFound)
     WalkStyle fast;
     fast.declaredRate = 120.0;
     const std::string walk = MadeWalk();
-    const struct
-    {
-        const char* what;
-        std::string text;
-        const char* found;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*> rows[] = {
         {"a joint that turns away for a frame", WithValues(walk, 40,                                 kHandY, {"75"}), "170 spike"},
         {"one that does for two",                              WithValues(walk,                                  40,                                                                    kHandY, {"75", "74"}), "170 spike"},
         {"a hip that jumps aside for a frame",WithValues(walk,40,kHipX, {"30"}), "170 spike"},
@@ -61,10 +57,10 @@ TEST(PoseFaults, AreFound)
         {"120 frames a second said to be 24",                                     MadeWalk(slow),                          "129 wrong-rate"},
         {"30 frames a second said to be 120",                                     MadeWalk(fast),                                     "129 wrong-rate"       },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, found] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(CExamined(row.text).Found(), row.found);
+        SCOPED_TRACE(what);
+        EXPECT_EQ(CExamined(text).Found(), found);
     }
 }
 
@@ -74,20 +70,16 @@ TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
     other.rate = other.declaredRate = 47.0; // nobody's rate, and right
     other.frames = 150;
     const std::string walk = MadeWalk();
-    const struct
-    {
-        const char* what;
-        std::string text;
-    } rows[] = {
+    const std::tuple<const char*, std::string> rows[] = {
         {"a quick turn that stays",           WithValues(walk,                             87, kHandY, {"75", "75", "75"})},
         {"a strike: out and back on the way",                             WithValues(walk,                                                     40, kHandY, {"30", "65", "75", "60", "25"})},
         {"a turn given as one more whole turn", WithValues(walk, 40, kHandY, {"360"})},
         {"an odd rate that is right",                             MadeWalk(other)                                        },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(CExamined(row.text).Found(), "");
+        SCOPED_TRACE(what);
+        EXPECT_EQ(CExamined(text).Found(), "");
     }
 }
 
@@ -141,11 +133,7 @@ TEST(Healthy, FilesOfEveryStyleHaveNoFault)
         return MadeWalk(style);
     };
     const std::string walk = MadeWalk();
-    const struct
-    {
-        const char* what;
-        std::string text;
-    } rows[] = {
+    const std::tuple<const char*, std::string> rows[] = {
         {"as it is",                   walk                                                                         },
         {"CR LF",                      AllReplaced(walk,                                                              "\n", "\r\n")},
         {"tabs between the values",                     AllReplaced(walk,                                                                                                  " 0.000000", "\t0.000000")},
@@ -163,13 +151,13 @@ TEST(Healthy, FilesOfEveryStyleHaveNoFault)
         {"one frame",                     styled([](WalkStyle& s) { s.frames = 1; })                                             },
         {"100 frames a second",                     styled([](WalkStyle& s) { s.rate = s.declaredRate = 100; })                                              },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text] : rows)
     {
-        SCOPED_TRACE(row.what);
-        CExamined examined(row.text);
+        SCOPED_TRACE(what);
+        CExamined examined(text);
         EXPECT_EQ(examined.Found(), "");
         EXPECT_TRUE(examined.Loads());
-        EXPECT_TRUE(examined.Mended() == row.text) << "nothing to mend";
+        EXPECT_TRUE(examined.Mended() == text) << "nothing to mend";
     }
 }
 
