@@ -2,18 +2,13 @@
 #include "ProfileFixture.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
 TEST(BoneOffsetDialog, RotationLimitsAreUneven)
 {
-    const struct
-    {
-        const char* what;
-        int axis;
-        const char* text;
-        const char* shown;
-    } rows[] = {
+    const std::tuple<const char*, int, const char*, const char*> rows[] = {
         {"X at half a circle",  0, "-180",        "-180"},
         {"X beyond",            0, "181",         "7"   },
         {"Y at its limit",      1, "179",         "179" },
@@ -23,14 +18,14 @@ TEST(BoneOffsetDialog, RotationLimitsAreUneven)
         {"no number is 0",      0, "",            "0"   },
         {"beyond 32 bits",      0, "99999999999", "7"   },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, axis, text, shown] : rows)
     {
         RowNumbers numbers;
         numbers.rotation = {7, 7, 7};
         CBoneOffsetDialog dialog(numbers);
-        dialog.LeaveRotation(row.axis, row.text);
-        EXPECT_EQ(dialog.RotationText(row.axis), row.shown) << row.what;
-        EXPECT_EQ(std::to_string(dialog.Numbers().rotation[size_t(row.axis)]), row.shown) << row.what;
+        dialog.LeaveRotation(axis, text);
+        EXPECT_EQ(dialog.RotationText(axis), shown) << what;
+        EXPECT_EQ(std::to_string(dialog.Numbers().rotation[size_t(axis)]), shown) << what;
     }
 }
 

@@ -4,6 +4,7 @@
 #include "TempFolder.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 
@@ -32,12 +33,7 @@ std::string Describe(const MapLine& line)
 
 TEST(MapLines, LinesSayWhatTheirKeySays)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* says;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"free text",        "Unknown Source",           "text"         },
         {"empty",            "",                         "text"         },
         {"position, commas", "Position 1,-2,3",          "at 1,-2,3"    },
@@ -52,11 +48,11 @@ TEST(MapLines, LinesSayWhatTheirKeySays)
         {"cut mapping",      "A <--->",                  "A>"           },
         {"fixed row",        "* Head . .1,2,3",          "fixed Head"   },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, says] : rows)
     {
-        const MapLine line = ParseMapLine(row.text);
-        EXPECT_EQ(line.text, row.text);
-        EXPECT_EQ(Describe(line), row.says) << row.what;
+        const CMapLine line = ParseMapLine(text);
+        EXPECT_EQ(line.text, text);
+        EXPECT_EQ(Describe(line), says) << what;
     }
 }
 

@@ -6,6 +6,7 @@
 #include "ProfileFit.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -50,26 +51,20 @@ TEST_F(ProfileEditor, ApplyingFillsTheTablesWithWhatDiffers)
 
 TEST_F(ProfileEditor, OneMissingBoneFailsTheProfileAndSparesTheOtherRows)
 {
-    const struct
-    {
-        const char* what;
-        const char* lines;
-        const char* verdict;
-        bool rootMapping;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, bool> rows[] = {
         {"source missing",       "None x LowerTorso 0\nA x Head 0\n",   "3 of 4, misfit", true },
         {"target missing",       "B x None 0\nA x Head 0\n",            "3 of 4, misfit", false},
         {"fixed target missing", "* None . .1,2,3\nA x Head 0\n",       "3 of 4, misfit", false},
         {"all there, no root",   "A x Head 0\n",                        "3 of 3, fits",   false},
         {"fixed root counts",    "* lowertorso . .1,2,3\nA x Head 0\n", "4 of 4, fits",   true },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, lines, verdict, rootMapping] : rows)
     {
-        m_kEditor.LoadProfile(MakeProfile(std::string("N\n") + row.lines));
+        m_kEditor.LoadProfile(MakeProfile(std::string("N\n") + lines));
         m_kEditor.RebuildSourceTree();
-        EXPECT_EQ(Apply(), row.verdict) << row.what;
-        EXPECT_EQ(m_kEditor.HasRootMapping(), row.rootMapping) << row.what;
-        EXPECT_TRUE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("A"))) << row.what;
+        EXPECT_EQ(Apply(), verdict) << what;
+        EXPECT_EQ(m_kEditor.HasRootMapping(), rootMapping) << what;
+        EXPECT_TRUE(m_kEditor.SourceTree().IsMapped(m_kEditor.FindSourceItem("A"))) << what;
     }
 }
 
@@ -152,25 +147,21 @@ TEST(ProfileFit, NamesTheSideTheLineAndTheNearestBone)
 
 TEST_F(ProfileEditor, MeasuredFitAgreesWithApplying)
 {
-    const struct
-    {
-        const char* lines;
-        bool drivesRoot;
-    } rows[] = {
+    const std::tuple<const char*, bool> rows[] = {
         {"A x LowerTorso 0\n",                   true },
         {"* LowerTorso . .1,2,3\n",              false},
         {"a x Head 0\nB x head 0\n\n",           false},
         {"None x LowerTorso 0\nA x LPelvis 0\n", false},
         {"\n* RPelvis\n* None\n",                false},
     };
-    for (const auto& row : rows)
+    for (const auto& [lines, drivesRoot] : rows)
     {
-        Load(std::string("N\nFrameRate 30\n") + row.lines);
+        Load(std::string("N\nFrameRate 30\n") + lines);
         CProfileFit fit;
         MeasureFit(m_kEditor.ProfilePath(), m_spkSource.Get(), m_spkTarget.Get(), fit);
         const char* verdict = fit.missing.empty() ? ", fits" : ", misfit";
         EXPECT_EQ(Apply(), std::to_string(fit.foundCount) + " of " + std::to_string(fit.rowCount) + verdict);
-        EXPECT_EQ(fit.drivesRoot, row.drivesRoot) << row.lines;
+        EXPECT_EQ(fit.drivesRoot, drivesRoot) << lines;
     }
     EXPECT_EQ(MeasureFit(m_kEditor.Rows(), m_spkSource.Get(), m_spkTarget.Get()).missing.size(), 1u);
 }

@@ -2,6 +2,7 @@
 #include "ProfileFixture.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -21,14 +22,7 @@ std::string Joined(const std::vector<std::string>& messages)
 
 TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
 {
-    const struct
-    {
-        const char* what;
-        int field;
-        const char* text;
-        const char* shown;
-        const char* message;
-    } rows[] = {
+    const std::tuple<const char*, int, const char*, const char*, const char*> rows[] = {
         {"rate too low",            kFrameRateField, "10",          "30",     "157 30 240"      },
         {"rate too high",           kFrameRateField, "241",         "240",    "157 30 240"      },
         {"no number",               kFrameRateField, "fast",        "30",     "157 30 240"      },
@@ -37,14 +31,14 @@ TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
         {"at the limit",            kOffsetYField,   "10000",       "10000",  ""                },
         {"what follows counts not", kFrameRateField, "60 fps",      "60",     ""                },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, field, text, shown, message] : rows)
     {
         CProfileEditorDialog editor(m_kOwner);
-        editor.EditField(row.field, row.text);
+        editor.EditField(field, text);
         editor.LeaveField();
-        EXPECT_EQ(editor.FieldText(row.field), row.shown) << row.what;
-        EXPECT_EQ(editor.IsDirty(), std::string(row.shown) != "30") << row.what;
-        EXPECT_EQ(Joined(m_kOwner.TakeMessages()), row.message) << row.what;
+        EXPECT_EQ(editor.FieldText(field), shown) << what;
+        EXPECT_EQ(editor.IsDirty(), std::string(shown) != "30") << what;
+        EXPECT_EQ(Joined(m_kOwner.TakeMessages()), message) << what;
     }
 }
 
@@ -94,12 +88,7 @@ TEST_F(ProfileEditor, RefusedNameGivesWayToTheOldOne)
 TEST_F(ProfileEditor, OwnerHearsOfEachChangeOfTheProfileSet)
 {
     const std::string path = MakeProfile("Mine\nA x Head 0\n");
-    const struct
-    {
-        const char* what;
-        std::function<void()> change;
-        int setChanges;
-    } rows[] = {
+    const std::tuple<const char*, std::function<void()>, int> rows[] = {
         {"counting",    [&] { m_kEditor.CountMatches(path, nullptr, nullptr); }, 0},
         {"loading",     [&] { m_kEditor.LoadProfile(path); },                    1},
         {"marking",     [&] { m_kEditor.MarkChanged(); },                        1},
@@ -111,11 +100,11 @@ TEST_F(ProfileEditor, OwnerHearsOfEachChangeOfTheProfileSet)
              m_kEditor.LeaveField();
          },                                                                      1},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, change, setChanges] : rows)
     {
         m_kOwner.m_iSetChanges = 0;
-        row.change();
-        EXPECT_EQ(m_kOwner.m_iSetChanges, row.setChanges) << row.what;
+        change();
+        EXPECT_EQ(m_kOwner.m_iSetChanges, setChanges) << what;
     }
     m_kOwner.m_iStateChanges = 0;
     m_kEditor.SelectSourceItem(0);
@@ -126,13 +115,7 @@ TEST_F(ProfileEditor, OwnerHearsOfEachChangeOfTheProfileSet)
 TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
 {
     Load("N\nA x Waist 0\n");
-    const struct
-    {
-        const char* what;
-        const char* source;
-        const char* target;
-        bool addToMap;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, bool> rows[] = {
         {"both free",                  "B",    "Head",    true },
         {"nothing selected in source", "none", "Head",    false},
         {"nothing selected in target", "B",    "none",    false},
@@ -141,10 +124,10 @@ TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
         {"pelvis takes no source",     "B",    "LPelvis", false},
         {"neither does the other",     "B",    "RPelvis", false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, source, target, addToMap] : rows)
     {
-        SelectBones(row.source, row.target);
-        EXPECT_EQ(m_kEditor.Buttons().addToMap, row.addToMap) << row.what;
+        SelectBones(source, target);
+        EXPECT_EQ(m_kEditor.Buttons().addToMap, addToMap) << what;
     }
 }
 
@@ -165,28 +148,23 @@ TEST_F(ProfileEditor, RowButtonsFollowTheSelection)
     m_kEditor.UpdateButtons();
     EXPECT_FALSE(m_kEditor.Buttons().removeAll);
     Load("N\nA x Waist 0\nB x Head 0\n");
-    const struct
-    {
-        const char* what;
-        const char* selected; // digits
-        bool remove;
-        bool boneOffset;
-    } rows[] = {
+    // selected: digits
+    const std::tuple<const char*, const char*, bool, bool> rows[] = {
         {"none",           "",   false, false},
         {"one",            "1",  true,  true },
         {"two",            "01", true,  false},
         {"a fixed one",    "2",  false, true },
         {"one among them", "03", false, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, selected, remove, boneOffset] : rows)
     {
         m_kEditor.SelectOnlyRow(CMapRowTable::kNone);
-        for (const char digit : std::string_view(row.selected))
+        for (const char digit : std::string_view(selected))
             m_kEditor.SelectRow(digit - '0', true);
         m_kEditor.UpdateButtons();
-        EXPECT_EQ(m_kEditor.Buttons().remove, row.remove) << row.what;
-        EXPECT_EQ(m_kEditor.Buttons().boneOffset, row.boneOffset) << row.what;
-        EXPECT_TRUE(m_kEditor.Buttons().removeAll) << row.what;
+        EXPECT_EQ(m_kEditor.Buttons().remove, remove) << what;
+        EXPECT_EQ(m_kEditor.Buttons().boneOffset, boneOffset) << what;
+        EXPECT_TRUE(m_kEditor.Buttons().removeAll) << what;
     }
 }
 

@@ -5,6 +5,7 @@
 #include <filesystem>
 
 #include <random>
+#include <tuple>
 
 namespace gw {
 
@@ -85,12 +86,7 @@ TEST(CProfileTexts, ThePackStandsForFilesThatAreAsTheyWere)
 
 TEST(ProfileReader, LinesSayWhatTheirFormSays)
 {
-    const struct
-    {
-        const char* what;
-        std::string text;
-        std::string lines;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string> rows[] = {
         {"nothing but a name",               "Only a name",                          ""                                            },
         {"a name and its end",               "Name\n",                               ""                                            },
         {"keywords in any case",             "N\nFRAMERATE 60\nposition 1 -2 3.9\n", "2 rate 60; 3 at 1,-2,3; "                    },
@@ -113,8 +109,8 @@ TEST(ProfileReader, LinesSayWhatTheirFormSays)
         {"CR LF, no last line end",          "N\r\nFrameRate 60\r\nA x B 1",         "2 rate 60; 3 A>B 1,0,0 1,2,3; "              },
         {"a byte order mark",                "\xef\xbb\xbfN\nFrameRate 60\n",        "2 rate 60; "                                 },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(ReadAll(row.text), row.lines) << row.what;
+    for (const auto& [what, text, lines] : rows)
+        EXPECT_EQ(ReadAll(text), lines) << what;
 }
 
 TEST(ProfileReader, BuffersCutLinesAndTokens)
@@ -130,21 +126,16 @@ TEST(ProfileReader, BuffersCutLinesAndTokens)
 TEST(ProfileReader, NameIsTheFirstLineWithoutItsEnd)
 {
     const CTempFolder folder;
-    const struct
-    {
-        const char* what;
-        std::string text;
-        std::string name;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string> rows[] = {
         {"blanks inside stay, those at the end go", "My own  one \t \r\nFrameRate 30\n", "My own  one"},
         {"byte order mark",                         "\xef\xbb\xbfName\n",                "Name"       },
         {"empty file",                              "",                                  ""           },
         {"empty line",                              "\nFrameRate 30\n",                  ""           },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, name] : rows)
     {
-        WriteBytes(folder.Path("a.prf"), row.text);
-        EXPECT_EQ(ReadProfileName(folder.Path("a.prf")), row.name) << row.what;
+        WriteBytes(folder.Path("a.prf"), text);
+        EXPECT_EQ(ReadProfileName(folder.Path("a.prf")), name) << what;
     }
     WriteBytes(folder.Path("a.prf"), std::string(5000, 'n'));
     EXPECT_EQ(ReadProfileName(folder.Path("a.prf")), std::string(1024, 'n')) << "rubbish without a line end";

@@ -5,6 +5,7 @@
 #include "Text.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -48,12 +49,7 @@ TEST_F(ProfileEditor, LaterRowOfATargetKeepsSourceAndFirstRowKeepsRotation)
 
 TEST_F(ProfileEditor, CountersAndAnswerTellHowAFileFits)
 {
-    const struct
-    {
-        const char* what;
-        const char* lines;
-        const char* verdict;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"no rows",              "",                                         "0 of 0, fits"  },
         {"both found",           "A x Head 0\nB x Waist 0\n",                "2 of 2, fits"  },
         {"names without case",   "a x HEAD 0\n",                             "1 of 1, fits"  },
@@ -65,8 +61,8 @@ TEST_F(ProfileEditor, CountersAndAnswerTellHowAFileFits)
         {"a blank line repeats", "A x Head 0\n\n",                           "2 of 2, fits"  },
         {"keywords count not",   "FrameRate 60\nPosition 1 2 3\nA x Head\n", "1 of 1, fits"  },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(Count(MakeProfile(std::string("N\n") + row.lines)), row.verdict) << row.what;
+    for (const auto& [what, lines, verdict] : rows)
+        EXPECT_EQ(Count(MakeProfile(std::string("N\n") + lines)), verdict) << what;
     EXPECT_FALSE(m_kEditor.CountMatches(MakeProfile("N\nNone x Head 0\n"), nullptr, nullptr))
         << "no counters";
     CProfileEditorDialog noScenes(m_kOwner);
@@ -169,13 +165,8 @@ TEST_F(ProfileEditor, LoadingAsksToSaveWhatWasChanged)
 
 TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
 {
-    const struct
-    {
-        const char* what;
-        const char* name;
-        const char* inUse; // between bars
-        const char* newName;
-    } rows[] = {
+    // inUse: between bars
+    const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
         {"plain",                   "P",              "P",              "P(1)"             },
         {"numbered",                "P(1)",           "x|P(1)",         "P(2)"             },
         {"next is taken",           "A(2)",           "A(2)|a(3) ",     "A(4)"             },
@@ -187,19 +178,19 @@ TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
         {"last pair counts",        "P(3)(4)",        "P(3)(4)",        "P(3)(5)"          },
         {"number beyond 32 bits",   "P(99999999999)", "P(99999999999)", "P(99999999999)(1)"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, name, inUse, newName] : rows)
     {
-        SCOPED_TRACE(row.what);
-        m_kNamesInUse = SplitAtBars(row.inUse);
+        SCOPED_TRACE(what);
+        m_kNamesInUse = SplitAtBars(inUse);
         const std::string path =
-            MakeProfile(std::string(row.name) + "\nA x Head 0\n", std::string(row.what) + ".prf");
+            MakeProfile(std::string(name) + "\nA x Head 0\n", std::string(what) + ".prf");
         MakeReadOnly(path);
         m_kEditor.LoadProfile(path);
         m_kEditor.MarkChanged();
-        EXPECT_EQ(m_kEditor.FieldText(kNameField), row.newName);
+        EXPECT_EQ(m_kEditor.FieldText(kNameField), newName);
         EXPECT_TRUE(m_kEditor.IsDirty());
         m_kEditor.MarkChanged();
-        EXPECT_EQ(m_kEditor.FieldText(kNameField), row.newName) << "once is enough";
+        EXPECT_EQ(m_kEditor.FieldText(kNameField), newName) << "once is enough";
         m_kOwner.m_eAnswer = EAnswer::No;
     }
 }

@@ -2,6 +2,7 @@
 #include "ProfileFixture.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -66,12 +67,7 @@ TEST_F(ProfileUndo, EveryCommandIsTakenBackAndRepeated)
         dialog.ChooseAxis(0, 5);
         return true;
     };
-    const struct
-    {
-        const char* what;
-        std::function<void()> command;
-        const char* after;
-    } rows[] = {
+    const std::tuple<const char*, std::function<void()>, const char*> rows[] = {
         {"add",        [this] { Add("C", "LowerTorso"); },                  "N 30 A-Waist B-Head C-LowerTorso *"},
         {"remove",     [this] { Remove(0); },                               "N 30 B-Head *"                     },
         {"remove all", [this] { m_kEditor.ClickButton(kRemoveAllButton); }, "N 30"                              },
@@ -83,20 +79,20 @@ TEST_F(ProfileUndo, EveryCommandIsTakenBackAndRepeated)
              m_kEditor.DoubleClickRow(1);
          },                                                                 "N 30 A-Waist B-Head *"             },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, command, after] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         Load("N\nFrameRate 30\nA x Waist 1,2,3\nB x Head 4,5,6\n");
         const auto texts = RowTexts(m_kEditor.Rows());
-        row.command();
+        command();
         const auto changed = RowTexts(m_kEditor.Rows());
-        EXPECT_EQ(Seen(), row.after);
+        EXPECT_EQ(Seen(), after);
         m_kEditor.Undo();
         EXPECT_EQ(Seen(), "N 30 A-Waist B-Head") << "as it was loaded";
         EXPECT_EQ(RowTexts(m_kEditor.Rows()), texts);
         EXPECT_EQ(m_kEditor.FieldText(kNameField), "N");
         m_kEditor.Redo();
-        EXPECT_EQ(Seen(), row.after);
+        EXPECT_EQ(Seen(), after);
         EXPECT_EQ(RowTexts(m_kEditor.Rows()), changed);
         m_kEditor.PromptSaveChanges();
     }
