@@ -3,6 +3,7 @@
 #include "PreviewScene.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -54,13 +55,7 @@ TEST(Mouse, DraggingMovesTheCamera)
         int y;
         DragKeys keys;
     };
-    const struct
-    {
-        const char* what;
-        std::vector<Move> moves;
-        Vec3 pan;
-        float eyeZ;
-    } rows[] = {
+    const std::tuple<const char*, std::vector<Move>, Vec3, float> rows[] = {
         {"right and up pans",             {{110, 95, {}}},                        {10, 5, 0}, 500},
         {"moves count from the last one", {{110, 95, {}}, {109, 96, {}}},         {9, 4, 0},  500},
         {"Ctrl and up moves away",        {{110, 95, kCtrl}},                     kVec3Zero,  505},
@@ -70,17 +65,17 @@ TEST(Mouse, DraggingMovesTheCamera)
         {"also with Ctrl",                {{110, 95, kBoth}},                     kVec3Zero,  500},
         {"held moves are passed over",    {{150, 150, kShift}, {151, 150, {}}},   {1, 0, 0},  500},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, moves, pan, eyeZ] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         CCountedView view;
         view.SetScene(MakeScene({kVec3Zero, 200}).Get(), 1.0f, 1.0f);
         view.MouseDown(100, 100);
-        for (const Move& move : row.moves)
+        for (const Move& move : moves)
             view.MouseMove(move.x, move.y, move.keys);
-        EXPECT_EQ(view.m_kPan, row.pan);
-        EXPECT_EQ(view.m_kCamera.m_kEye, (Vec3{0, 0, row.eyeZ}));
-        EXPECT_EQ(view.m_iRepaints, 1 + static_cast<int>(row.moves.size())) << "each is drawn, held ones too";
+        EXPECT_EQ(view.m_kPan, pan);
+        EXPECT_EQ(view.m_kCamera.m_kEye, (Vec3{0, 0, eyeZ}));
+        EXPECT_EQ(view.m_iRepaints, 1 + static_cast<int>(moves.size())) << "each is drawn, held ones too";
     }
 }
 

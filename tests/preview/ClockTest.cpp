@@ -3,6 +3,7 @@
 #include "PreviewScene.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -44,14 +45,7 @@ void ExpectStand(int eighth, const Operations& operations, float time, bool play
 // From an eighth of the motion on, which is half a frame.
 TEST(Clock, StandsWhereEachOperationLeavesIt)
 {
-    const struct
-    {
-        const char* what;
-        int eighth;
-        Operations operations;
-        float time;
-        bool plays;
-    } rows[] = {
+    const std::tuple<const char*, int, Operations, float, bool> rows[] = {
         {"a place on the scroll bar",            2, {},                                         0.5f, false},
         {"a place past its end",                 9, {},                                         2.0f, false},
         {"a step on",                            2, {&View::StepForward},                       1.0f, false},
@@ -68,10 +62,10 @@ TEST(Clock, StandsWhereEachOperationLeavesIt)
         {"a step while playing",                 2, {&View::Play, &View::StepForward},          1.0f, true },
         {"a tick after stopping",                2, {&View::Play, &View::Stop, &View::Advance}, 0.5f, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, eighth, operations, time, plays] : rows)
     {
-        SCOPED_TRACE(row.what);
-        ExpectStand(row.eighth, row.operations, row.time, row.plays);
+        SCOPED_TRACE(what);
+        ExpectStand(eighth, operations, time, plays);
     }
 }
 

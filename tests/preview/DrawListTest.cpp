@@ -3,6 +3,7 @@
 #include "PreviewScene.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -31,11 +32,7 @@ void ExpectLine(const std::vector<LineEnd>& lines, size_t first, const Vec3& fro
 
 TEST(DrawList, LastSixthOfTheTrianglesIsLeftOut)
 {
-    const struct
-    {
-        int32_t triangles;
-        size_t drawn;
-    } rows[] = {
+    const std::tuple<int32_t, size_t> rows[] = {
         {0,  0 },
         {1,  1 },
         {2,  2 },
@@ -47,17 +44,17 @@ TEST(DrawList, LastSixthOfTheTrianglesIsLeftOut)
         {12, 10},
         {72, 60},
     };
-    for (const auto& row : rows)
+    for (const auto& [triangles, drawn] : rows)
     {
-        SCOPED_TRACE(row.triangles);
+        SCOPED_TRACE(triangles);
         const Ref<CNode> scene = MakeScene({});
-        AttachBone(*scene, "bone", row.triangles);
+        AttachBone(*scene, "bone", triangles);
         scene->UpdateScene(0.0f, true);
         const std::vector<LineEnd> lines = LinesOf(*scene);
-        EXPECT_EQ(lines.size(), kAxisEnds + 6 * row.drawn);
-        if (row.drawn > 0)
+        EXPECT_EQ(lines.size(), kAxisEnds + 6 * drawn);
+        if (drawn > 0)
         {
-            EXPECT_EQ(lines.back().point.z, static_cast<float>(row.drawn - 1)) << "the first ones are drawn";
+            EXPECT_EQ(lines.back().point.z, static_cast<float>(drawn - 1)) << "the first ones are drawn";
         }
     }
 }
@@ -97,12 +94,7 @@ TEST(DrawList, AxesFollowTheMeshWithItsScale)
 
 TEST(DrawList, HighlightIsExactlyTheParentsName)
 {
-    const struct
-    {
-        const char* highlight;
-        const char* parent;
-        bool shines;
-    } rows[] = {
+    const std::tuple<const char*, const char*, bool> rows[] = {
         {"Hips",  "Hips",  true },
         {"hips",  "Hips",  false},
         {"Hip",   "Hips",  false},
@@ -113,16 +105,16 @@ TEST(DrawList, HighlightIsExactlyTheParentsName)
         {"Hips",  nullptr, false},
         {"",      nullptr, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [highlight, parent, shines] : rows)
     {
-        SCOPED_TRACE(row.highlight);
+        SCOPED_TRACE(highlight);
         const Ref<CNode> scene = MakeScene({});
         scene->SetName("scene");
-        AttachBone(*scene, row.parent, 1).SetName("mesh");
+        AttachBone(*scene, parent, 1).SetName("mesh");
         AttachBone(*scene, "other", 1);
-        const std::vector<LineEnd> lines = LinesOf(*scene, row.highlight);
+        const std::vector<LineEnd> lines = LinesOf(*scene, highlight);
         ASSERT_EQ(lines.size(), 2 * (kAxisEnds + 6));
-        EXPECT_EQ(lines[kAxisEnds].color, row.shines ? kHighlightColor : kBoneColor);
+        EXPECT_EQ(lines[kAxisEnds].color, shines ? kHighlightColor : kBoneColor);
         EXPECT_EQ(lines.back().color, kBoneColor);
     }
 }

@@ -8,6 +8,7 @@
 
 #include <GL/gl.h>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -120,27 +121,23 @@ TEST_F(PictureTest, ShowsWhatIsBetweenOneAndTenThousandAway)
 {
     if (!m_bCanDraw)
         return;
-    const struct
-    {
-        float distance;
-        bool shown;
-    } rows[] = {
+    const std::tuple<float, bool> rows[] = {
         {0.98f,     false},
         {1.02f,     true },
         {9'800.0f,  true },
         {10'200.0f, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [distance, shown] : rows)
     {
-        SCOPED_TRACE(row.distance);
+        SCOPED_TRACE(distance);
         const Ref<CNode> scene = MakeScene({});
         CTriMesh& mesh = AttachBone(*scene, "bone", 1);
         for (size_t i = 0; i < 3; ++i)
-            mesh.WorldXYZBuffer()[i] = (mesh.XYZBuffer()[i] * 0.02f - kVec3UnitZ) * row.distance;
+            mesh.WorldXYZBuffer()[i] = (mesh.XYZBuffer()[i] * 0.02f - kVec3UnitZ) * distance;
         CGLView view;
         view.SetScene(scene.Get(), 1.0f, 1.0f);
         view.m_kCamera.m_kLookAt = -kVec3UnitZ;
-        EXPECT_EQ(CountColor(Draw(view), kBoneColor) > 50, row.shown);
+        EXPECT_EQ(CountColor(Draw(view), kBoneColor) > 50, shown);
     }
 }
 

@@ -8,6 +8,7 @@
 
 #include <gtest/gtest.h>
 #include <png.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -86,14 +87,7 @@ TEST(RenderPicture, GivesEachPoseItsPart)
     const RgbPicture strip = TwoMotions(3);
     if (pair.rgb.empty())
         return;
-    const struct
-    {
-        const char* what;
-        const RgbPicture& picture;
-        PixelArea area;
-        LineColor shown;
-        LineColor missing;
-    } rows[] = {
+    const std::tuple<const char*, const RgbPicture&, PixelArea, LineColor, LineColor> rows[] = {
         {"left side",                 pair,  {0, 0, 50, 73},    kBoneColor,      kHighlightColor},
         {"right side",                pair,  {50, 0, 101, 73},  kHighlightColor, kBoneColor     },
         {"first pose",                strip, {0, 0, 33, 36},    kBoneColor,      kHighlightColor},
@@ -103,25 +97,18 @@ TEST(RenderPicture, GivesEachPoseItsPart)
         {"second pose of the result", strip, {33, 36, 67, 73},  kHighlightColor, kBoneColor     },
         {"third pose of the result",  strip, {67, 36, 101, 73}, kHighlightColor, kBoneColor     },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, picture, area, shown, missing] : rows)
     {
-        SCOPED_TRACE(row.what);
-        EXPECT_GT(CountColor(row.picture, row.shown, row.area), 20);
-        EXPECT_EQ(CountColor(row.picture, row.missing, row.area), 0);
-        EXPECT_EQ(CountColor(row.picture, {0, 0, 0}, row.area), 0) << "a part that was not drawn";
+        SCOPED_TRACE(what);
+        EXPECT_GT(CountColor(picture, shown, area), 20);
+        EXPECT_EQ(CountColor(picture, missing, area), 0);
+        EXPECT_EQ(CountColor(picture, {0, 0, 0}, area), 0) << "a part that was not drawn";
     }
 }
 
 TEST(RenderPicture, RefusesWhatHasNoPixels)
 {
-    const struct
-    {
-        const char* what;
-        size_t motions;
-        int width;
-        int height;
-        int poses;
-    } rows[] = {
+    const std::tuple<const char*, size_t, int, int, int> rows[] = {
         {"no motion",              0, 10,               10,      1 },
         {"no width",               1, 0,                10,      1 },
         {"a height below 0",       1, 10,               -10,     1 },
@@ -131,14 +118,14 @@ TEST(RenderPicture, RefusesWhatHasNoPixels)
         {"more poses than pixels", 1, 10,               10,      11},
         {"more motions than rows", 3, 10,               2,       2 },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, motions, width, height, poses] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         PictureOptions options;
-        options.motions.resize(row.motions);
-        options.width = row.width;
-        options.height = row.height;
-        options.poseCount = row.poses;
+        options.motions.resize(motions);
+        options.width = width;
+        options.height = height;
+        options.poseCount = poses;
         RgbPicture picture;
         EXPECT_EQ(RenderPicture(options, picture), EPictureAnswer::BadSize);
     }
