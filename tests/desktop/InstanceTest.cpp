@@ -11,9 +11,9 @@
 #include <QTest>
 #include <future>
 #include <gmock/gmock.h>
-
 #include <sys/socket.h>
 #include <sys/un.h>
+#include <tuple>
 #include <unistd.h>
 
 namespace gw {
@@ -116,11 +116,7 @@ TEST_F(Instances, WhatIsNoRequestIsPassedOver)
     const QByteArray endless("GWR1\xff\xff\xff\xff", 8);
     const QByteArray zeroInPath = MakeMessage(std::string("/takes\0/", 8));
     const QByteArray noUtf8 = MakeMessage("/takes/\xff\xfe");
-    const struct
-    {
-        const char* what;
-        QByteArray bytes;
-    } rows[] = {
+    const std::tuple<const char*, QByteArray> rows[] = {
         {"nothing",                ""                  },
         {"another protocol",       "GET / HTTP/1.1\r\n"},
         {"zeros",                  zeros               },
@@ -132,13 +128,13 @@ TEST_F(Instances, WhatIsNoRequestIsPassedOver)
         {"more than anybody says", flood               },
     };
     const CInstanceServer server(Remember());
-    for (const auto& row : rows)
+    for (const auto& [what, bytes] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         QLocalSocket caller;
         caller.connectToServer(InstanceSocketPath());
         ASSERT_TRUE(caller.waitForConnected());
-        caller.write(row.bytes);
+        caller.write(bytes);
         caller.flush();
         QTest::qWait(20);
         EXPECT_EQ(caller.readAll(), QByteArray());
@@ -180,12 +176,7 @@ TEST_F(Instances, TheyMeetWhereNobodyElseCanWrite)
     const std::string open = folder("open", 0x7777);
     const std::string far = folder(std::string(100, 'x'), 0x7700);
     const std::string none = m_kFolder.Path("none");
-    const struct
-    {
-        const char* what;
-        std::string runtimeFolder;
-        std::string meeting;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string> rows[] = {
         {"the runtime folder",     runtime, runtime},
         {"one that all can write", open,    own    },
         {"one that is too long",   far,     own    },
@@ -193,11 +184,11 @@ TEST_F(Instances, TheyMeetWhereNobodyElseCanWrite)
         {"a relative one",         "run",   own    },
         {"none",                   "",      own    },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, runtimeFolder, meeting] : rows)
     {
-        SCOPED_TRACE(row.what);
-        qputenv("XDG_RUNTIME_DIR", row.runtimeFolder.c_str());
-        EXPECT_EQ(InstanceSocketPath().toStdString(), row.meeting + "/TK_KESTRO_GAIT_CONV_1");
+        SCOPED_TRACE(what);
+        qputenv("XDG_RUNTIME_DIR", runtimeFolder.c_str());
+        EXPECT_EQ(InstanceSocketPath().toStdString(), meeting + "/TK_KESTRO_GAIT_CONV_1");
     }
     folder("gaitwright-" + std::to_string(geteuid()), 0x7777); // as an enemy would have made it
     EXPECT_EQ(InstanceSocketPath(), QString());

@@ -15,6 +15,7 @@
 #include <fstream>
 #include <gmock/gmock.h>
 #include <sstream>
+#include <tuple>
 
 namespace gw {
 
@@ -194,23 +195,19 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     person.Click("%adv");
     auto* const editor = person.Frame().findChild<QWidget*>(QStringLiteral("profileEditor"));
     Activate(*editor);
-    const struct
-    {
-        const char* what;
-        QWidget* pressedOver;
-    } rows[] = {
+    const std::tuple<const char*, QWidget*> rows[] = {
         {"over the main window",                    &person.Frame()},
         {"over the editor, which the click leaves", editor         },
         {"while another program had the keyboard",  nullptr        },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, pressedOver] : rows)
     {
-        SCOPED_TRACE(row.what);
-        Activate(row.pressedOver ? *row.pressedOver : *editor);
+        SCOPED_TRACE(what);
+        Activate(pressedOver ? *pressedOver : *editor);
         person.m_kBoxes.clear();
         person.WillChooseFolder(folder, 1);
         person.WillAnswer("ok");
-        person.PressLeft(EKey::LeftCtrl, row.pressedOver);
+        person.PressLeft(EKey::LeftCtrl, pressedOver);
         person.ClickSlowly("open");
         person.ReleaseLeft(EKey::LeftCtrl, &person.Frame());
         EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("2 BVH files are successful convert to HTR.")});

@@ -12,6 +12,7 @@
 #include <QTest>
 #include <functional>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -43,12 +44,7 @@ Act Key(Qt::Key key)
 
 TEST(MessageBox, EveryButtonAnswersForItself)
 {
-    const struct
-    {
-        EButtons buttons;
-        const char* name;
-        EAnswer answer;
-    } rows[] = {
+    const std::tuple<EButtons, const char*, EAnswer> rows[] = {
         {EButtons::OK,          "ok",     EAnswer::OK    },
         {EButtons::OKCancel,    "ok",     EAnswer::OK    },
         {EButtons::OKCancel,    "cancel", EAnswer::Cancel},
@@ -58,29 +54,24 @@ TEST(MessageBox, EveryButtonAnswersForItself)
         {EButtons::YesNo,       "yes",    EAnswer::Yes   },
         {EButtons::YesNo,       "no",     EAnswer::No    },
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(Ask(row.buttons, Press(row.name)), row.answer) << row.name;
+    for (const auto& [buttons, name, answer] : rows)
+        EXPECT_EQ(Ask(buttons, Press(name)), answer) << name;
 }
 
 TEST(MessageBox, EnterAnswersFirstAndWhatClosesAnswersMostCarefully)
 {
-    const struct
-    {
-        EButtons buttons;
-        EAnswer enter;
-        EAnswer escape;
-    } rows[] = {
+    const std::tuple<EButtons, EAnswer, EAnswer> rows[] = {
         {EButtons::OK,          EAnswer::OK,  EAnswer::OK    },
         {EButtons::OKCancel,    EAnswer::OK,  EAnswer::Cancel},
         {EButtons::YesNoCancel, EAnswer::Yes, EAnswer::Cancel},
         {EButtons::YesNo,       EAnswer::Yes, EAnswer::No    },
     };
-    for (const auto& row : rows)
+    for (const auto& [buttons, enter, escape] : rows)
     {
-        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Return)), row.enter);
-        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Enter), "Text", "Details"), row.enter);
-        EXPECT_EQ(Ask(row.buttons, Key(Qt::Key_Escape)), row.escape);
-        EXPECT_EQ(Ask(row.buttons, [](QWidget& box) { box.close(); }), row.escape);
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Return)), enter);
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Enter), "Text", "Details"), enter);
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Escape)), escape);
+        EXPECT_EQ(Ask(buttons, [](QWidget& box) { box.close(); }), escape);
     }
 }
 

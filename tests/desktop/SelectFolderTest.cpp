@@ -12,6 +12,7 @@
 #include <QLineEdit>
 #include <QTest>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -141,25 +142,20 @@ TEST_F(SelectFolder, GoesIntoFoldersAndUpAgain)
 
 TEST_F(SelectFolder, TakesAPathThatIsWritten)
 {
-    const struct
-    {
-        const char* what;
-        std::string text;
-        std::string folder;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string> rows[] = {
         {"a path",           m_kFolder.Path("day 1"),  "day 1/"},
         {"with a separator", m_kFolder.Path("day 1/"), "day 1/"},
         {"a name",           "day 2\\",                "day 2/"},
         {"nothing",          "",                       ""      },
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, folder] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         Open();
-        Write(row.text);
+        Write(text);
         QTest::keyClick(Child<QWidget>("102"), Qt::Key_Return);
         EXPECT_EQ(m_pkDialog->result(), QDialog::Accepted);
-        EXPECT_EQ(m_pkDialog->Choice().folder, m_kFolder.Path(row.folder));
+        EXPECT_EQ(m_pkDialog->Choice().folder, m_kFolder.Path(folder));
     }
 }
 

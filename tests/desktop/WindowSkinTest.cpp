@@ -3,6 +3,7 @@
 #include "TempFolder.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -13,12 +14,7 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
     std::string withoutBar = layout;
     withoutBar.erase(withoutBar.find("bar "),
                      withoutBar.find('\n', withoutBar.find("bar ")) - withoutBar.find("bar "));
-    const struct
-    {
-        const char* file;
-        std::string text;
-        const char* words;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*> rows[] = {
         {"bvh.cnt", "",                                 "has no size"          },
         {"bvh.cnt", withoutBar,                         "no child \"|playbar\""},
         {"bvh.cnt", layout + "button x 1 2 three 4\n",  "invalid line"         },
@@ -27,9 +23,9 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
         {"bvh.cnt", layout + "button x 1 2 3 4 none\n", "icons/none.svg"       },
         {"bvh.cnt", "size 1 99999\n" + layout,          "invalid line"         },
     };
-    for (const auto& row : rows)
+    for (const auto& [file, text, words] : rows)
     {
-        SCOPED_TRACE(row.words);
+        SCOPED_TRACE(words);
         const CTempFolder folder;
         for (const char* name : {"bvh.cnt", "bvh.ini", "bvh.qss"})
             WriteBytes(folder.Path(name), ReadBytes(whole + name));
@@ -39,9 +35,9 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
         CSkin skin;
         std::string problem;
         EXPECT_TRUE(skin.Load(folder.Path(), problem)) << problem;
-        WriteBytes(folder.Path(row.file), row.text);
+        WriteBytes(folder.Path(file), text);
         EXPECT_FALSE(skin.Load(folder.Path(), problem));
-        EXPECT_THAT(problem, testing::HasSubstr(row.words));
+        EXPECT_THAT(problem, testing::HasSubstr(words));
     }
     CSkin skin;
     std::string problem;
