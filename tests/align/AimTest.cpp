@@ -15,20 +15,13 @@
 #include "Skeleton.h"
 
 #include <gtest/gtest.h>
+#include <map>
 
 namespace gw {
 namespace {
 
-struct BoneRow
-{
-    const char* name;
-    const char* parent;
-    Vec3 offset;   // mm, in the parent's space
-    double aboutZ; // degrees at rest, against the parent
-};
-
 // A target as the host has it: bones along their own Y.
-constexpr BoneRow kBones[] = {
+constexpr MadeBone kBones[] = {
     {"LowerTorso", "",           {0, 923, 13},  0  },
     {"Waist",      "LowerTorso", {0, 95, 0},    0  },
     {"UpperTorso", "Waist",      {0, 150, 0},   0  },
@@ -44,32 +37,20 @@ constexpr BoneRow kBones[] = {
     {"LFoot",      "LCalf",      {0, 345, 0},   0  },
 };
 
-class CTarget
+class CTarget : public CMadeFigure
 {
 public:
-    CTarget()
+    CTarget() : CMadeFigure(kBones)
     {
-        for (const auto& [name, parent, offset, aboutZ] : kBones)
-        {
-            CNode* node = nullptr;
-            if (*parent)
-                node = &AttachNode(Bone(parent));
-            else
-                m_spkRoot = node = new CNode;
-            node->SetName(name);
-            node->m_kMatrix = Mat4Compose(TurnAbout(kVec3UnitZ, aboutZ), offset);
-            AttachBone(*node, name, 1, 100.0f);
-        }
-        m_spkRoot->UpdateScene(0.0f, true);
-        for (CNode* node : NodesOf(*m_spkRoot))
+        for (const MadeBone& bone : kBones)
+            AttachBone(Bone(bone.name), bone.name, 1, 100.0f);
+        Root().UpdateScene(0.0f, true);
+        for (CNode* node : NodesOf(Root()))
             m_kRest.emplace(node->GetName(), NormalizedRows(node->m_kWorldMatrix));
     }
-    CNode& Root() const { return *m_spkRoot; }
-    CNode& Bone(const std::string& name) const { return *FindNode(m_spkRoot.Get(), name.c_str()); }
     const Mat3& Rest(const std::string& name) const { return m_kRest.at(name); }
 
 private:
-    Ref<CNode> m_spkRoot;
     std::map<std::string, Mat3> m_kRest;
 };
 
@@ -77,7 +58,7 @@ private:
 void FillTable(CRetargeter& table, const CMadeBody& source, const CTarget& target)
 {
     table.SetScenes(source.Motion().root, &target.Root());
-    for (const BoneRow& bone : kBones)
+    for (const MadeBone& bone : kBones)
     {
         if (!source.HasJoint(bone.name))
             continue;
@@ -112,7 +93,7 @@ void ExpectBonesFollow(const CMadeBody& told, const CMadeBody& truth, const CTar
         const float time = static_cast<float>(frame) / motion.frequency;
         truth.Motion().root->UpdateScene(time, true);
         target.Root().UpdateScene(time, true);
-        for (const BoneRow& bone : kBones)
+        for (const MadeBone& bone : kBones)
         {
             if (!truth.HasJoint(bone.name) || !told.HasJoint(bone.name))
                 continue;
@@ -186,7 +167,7 @@ TEST(FindRestMisfits, NamesLimbsThatRowsTurnAtRest)
     const auto names = [&](const CMadeBody& source, bool spoil) {
         CRetargeter table;
         FillTable(table, source, target);
-        for (const BoneRow& bone : kBones)
+        for (const MadeBone& bone : kBones)
             table.SetOffsetAngles(&target.Bone(bone.name), spoil ? Vec3{0, 90, 0} : kVec3Zero);
         std::vector<std::string> found;
         for (const RestMisfit& misfit : FindRestMisfits(table, target.Root()))

@@ -1,8 +1,8 @@
 #include "CMadeBody.h"
 
+#include "BodyTree.h"
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
-#include "CKeyframeControl.h"
 #include "CPoseSampler.h"
 #include "Directions.h"
 #include "MotionNode.h"
@@ -18,14 +18,7 @@ namespace {
 
 constexpr float kFrequency = 1.0f / 30.0f;
 
-struct JointRow
-{
-    const char* name;
-    const char* parent;
-    Vec3 offset;
-};
-
-constexpr JointRow kJoints[] = {
+constexpr MadeBone kJoints[] = {
     {"LowerTorso", "",           {0, 90, 0} },
     {"Waist",      "LowerTorso", {0, 10, 0} },
     {"UpperTorso", "Waist",      {0, 15, 0} },
@@ -89,74 +82,56 @@ Vec3 RootPlace(int frame)
 
 CMadeBody::CMadeBody(const Telling& telling) : m_iFrames(telling.frameCount)
 {
-    for (const auto& [name, parent, offset] : kJoints)
+    const auto above = [&](const std::string& parent) {
+        return parent.empty() ? telling.world : telling.turn(parent);
+    };
+    std::vector<MadeBone> joints;
+    for (const MadeBone& joint : kJoints)
     {
-        const bool orphan = *parent && !m_kJoints.contains(parent);
-        if (!orphan && std::ranges::find(telling.without, name) == telling.without.end())
-            AddJoint(name, parent, offset, telling);
+        const bool orphan = *joint.parent && !HasJoint(joint.parent);
+        if (orphan || std::ranges::find(telling.without, joint.name) != telling.without.end())
+            continue;
+        m_kFigure.AddBone(joint.name, joint.parent, Turned(joint.offset, above(joint.parent)));
+        m_kNames.emplace_back(joint.name);
+        joints.push_back(joint);
     }
-    AddFrames(telling);
-}
-
-void CMadeBody::AddJoint(const std::string& name, const std::string& parent, const Vec3& offset,
-                         const Telling& telling)
-{
-    CNode* node = nullptr;
-    if (parent.empty())
-        m_spkRoot = node = new CNode;
-    else
-        node = &AttachNode(Joint(parent));
-    node->SetName(name.c_str());
-    const Mat3 above = parent.empty() ? telling.world : telling.turn(parent);
-    AttachTrack(*node, telling.frameCount, kFrequency, Mat4Compose(kMat3Identity, Turned(offset, above)));
-    m_kNames.push_back(name);
-    m_kJoints.emplace(name, node);
-}
-
-// Keys and, as the reader of BVH files makes them, bone meshes.
-void CMadeBody::AddFrames(const Telling& telling)
-{
+    m_kFigure.Record(
+        telling.frameCount,
+        [&](CMadeFigure& figure, int frame) {
+            for (const MadeBone& joint : joints)
+            {
+                Mat4& matrix = figure.Bone(joint.name).m_kMatrix;
+                const Mat3 turn = Mat3Transpose(telling.turn(joint.name)) * Pose(joint.name, frame);
+                matrix = Mat4Compose(turn * above(joint.parent),
+                                     *joint.parent ? matrix.Translation() * (telling.doubled ? 2.0f : 1.0f)
+                                                   : Turned(RootPlace(frame), telling.world));
+            }
+        },
+        kFrequency);
     for (const std::string& name : m_kNames)
-    {
-        CNode& node = Joint(name);
-        auto& track = static_cast<CKeyframeControl&>(*node.GetControl());
-        const CNode* const parent = node.GetParentNode();
-        const Vec3 offset = track.m_kRestMatrix.Translation();
-        const Mat3 above = parent ? telling.turn(parent->GetName()) : telling.world;
-        for (int frame = 0; frame < telling.frameCount; ++frame)
-        {
-            track.m_kRotationKeys.push_back(
-                QuatFromMat3(Mat3Transpose(telling.turn(name)) * Pose(name, frame) * above));
-            const Vec3 place =
-                parent ? offset * (telling.doubled ? 2.0f : 1.0f) : Turned(RootPlace(frame), telling.world);
-            track.m_kPositionKeys.push_back(place);
-            track.m_kScaleKeys.push_back(kVec3One);
-        }
-        std::vector<Vec3> children;
-        for (const CNode* child : NodesOf(node))
-        {
-            if (child->GetParentNode() == &node)
-                children.push_back(RestLocal(*child).Translation());
-        }
-        if (children.empty())
-            children.push_back(Turned(name == "RHand" ? kHandEnd : Vec3{0, 5, 0}, telling.turn(name)));
-        CBoneMesh& mesh = AttachBone(node, name, children.size(), 1.0f);
-        mesh.m_kEnd = node.HasNoNodeChild() ? children[0] : kVec3Zero;
-        if (children.size() == 1)
-            mesh.m_kMatrix = Mat4Compose(BoneTurn(children[0]), kVec3Zero);
-    }
-    m_spkRoot->UpdateScene(0.0f, true);
+        AddMesh(name, telling);
+    m_kFigure.Root().UpdateScene(0.0f, true);
 }
 
-CNode& CMadeBody::Joint(const std::string& name) const
+// As the reader of BVH files makes it.
+void CMadeBody::AddMesh(const std::string& name, const Telling& telling)
 {
-    return *m_kJoints.at(name);
+    CNode& node = Joint(name);
+    std::vector<Vec3> children;
+    for (const CNode* child : ChildNodes(node))
+        children.push_back(RestLocal(*child).Translation());
+    if (children.empty())
+        children.push_back(Turned(name == "RHand" ? kHandEnd : Vec3{0, 5, 0}, telling.turn(name)));
+    CBoneMesh& mesh = AttachBone(node, name, children.size(), 1.0f);
+    mesh.m_kEnd = node.HasNoNodeChild() ? children[0] : kVec3Zero;
+    if (children.size() == 1)
+        mesh.m_kMatrix = Mat4Compose(BoneTurn(children[0]), kVec3Zero);
 }
 
 BodyMotion CMadeBody::Motion() const
 {
     const auto joint = [this](const std::string& name) { return HasJoint(name) ? &Joint(name) : nullptr; };
-    BodyMotion motion{m_spkRoot.Get(), kFrequency, m_iFrames, {}};
+    BodyMotion motion{&m_kFigure.Root(), kFrequency, m_iFrames, {}};
     CBodyMap& body = motion.body;
     body.hip = joint("LowerTorso");
     body.spine = {joint("Waist"), joint("UpperTorso")};

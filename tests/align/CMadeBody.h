@@ -1,10 +1,9 @@
 #pragma once
 
 #include "Alignment.h"
-#include "CNode.h"
+#include "CMadeFigure.h"
 
 #include <functional>
-#include <map>
 #include <string>
 #include <vector>
 
@@ -29,18 +28,15 @@ public:
     explicit CMadeBody(const Telling& telling);
 
     BodyMotion Motion() const;
-    CNode& Joint(const std::string& name) const;
-    bool HasJoint(const std::string& name) const { return m_kJoints.contains(name); }
+    CNode& Joint(const std::string& name) const { return m_kFigure.Bone(name); }
+    bool HasJoint(const std::string& name) const { return m_kFigure.HasBone(name); }
     const std::vector<std::string>& Names() const { return m_kNames; }
 
 private:
-    void AddJoint(const std::string& name, const std::string& parent, const Vec3& offset,
-                  const Telling& telling);
-    void AddFrames(const Telling& telling);
+    void AddMesh(const std::string& name, const Telling& telling);
 
-    Ref<CNode> m_spkRoot;
     std::vector<std::string> m_kNames; // depth first
-    std::map<std::string, CNode*> m_kJoints;
+    CMadeFigure m_kFigure{std::span<const MadeBone>()};
     int m_iFrames;
 };
 

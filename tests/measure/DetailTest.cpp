@@ -1,6 +1,6 @@
 // What a comparison keeps frame by frame, and which frames it names.
 
-#include "CMadeFigure.h"
+#include "PairedFigures.h"
 #include "WorstFrames.h"
 
 #include <algorithm>

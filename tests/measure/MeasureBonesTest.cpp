@@ -1,8 +1,8 @@
 // Directions, jitter and travel of made clips, all within 1 % of what was put in.
 
 #include "Angles.h"
-#include "CMadeFigure.h"
 #include "FrameScale.h"
+#include "PairedFigures.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,8 +1,8 @@
 // Contacts, slide, sink, turn, tilt and knees of made clips, all within 1 % of what was put in.
 
 #include "Angles.h"
-#include "CMadeFigure.h"
 #include "FindContacts.h"
+#include "PairedFigures.h"
 
 #include <algorithm>
 #include <cmath>

@@ -1,7 +1,6 @@
 #include "CWalker.h"
 
 #include "Angles.h"
-#include "CKeyframeControl.h"
 #include "Skeleton.h"
 
 #include <cmath>
@@ -14,15 +13,30 @@ constexpr float kUpper = 45.0f;
 constexpr float kLower = 37.0f;
 constexpr const char* kSides[] = {"L", "R"};
 
-CNode* AddBone(CNode* parent, const std::string& name, const Vec3& offset, float degreesAboutZ = 0.0f)
-{
-    auto* const node = new CNode;
-    node->SetName(name.c_str());
-    node->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitZ, degreesAboutZ * kDegreesToRadians), offset);
-    if (parent)
-        parent->AttachChild(node);
-    return node;
-}
+constexpr MadeBone kBones[] = {
+    {"Hips",   "",       {0.0f, 88.0f, 0.0f}  },
+    {"LHip",   "Hips",   {9.0f, -4.0f, 0.0f}  },
+    {"LKnee",  "LHip",   {0.0f, -kUpper, 0.0f}},
+    {"LAnkle", "LKnee",  {0.0f, -kLower, 0.0f}},
+    {"LBall",  "LAnkle", {0.0f, -6.0f, 14.0f} },
+    {"RHip",   "Hips",   {-9.0f, -4.0f, 0.0f} },
+    {"RKnee",  "RHip",   {0.0f, -kUpper, 0.0f}},
+    {"RAnkle", "RKnee",  {0.0f, -kLower, 0.0f}},
+    {"RBall",  "RAnkle", {0.0f, -6.0f, 14.0f} },
+};
+constexpr MadeBone kTargetLegs[] = {
+    {"LowerTorso",           "",           {0.0f, 923.0f, 13.0f} },
+    {"LPelvis",              "LowerTorso", kVec3Zero,              180.0},
+    {"LThigh",                      "LPelvis",                           {-95.0f, 138.0f, 0.0f}                  },
+    {"LCalf",                      "LThigh",                            {0.0f, 360.0f, 0.0f}  },
+    {"LFoot",                      "LCalf",                            {0.0f, 345.0f, 0.0f}                   },
+    {"LToe",                      "LFoot",                             {0.0f, 62.0f, 130.0f}   },
+    {"RPelvis",                      "LowerTorso",                          kVec3Zero,            180.0},
+    {"RThigh",                 "RPelvis",                             {95.0f, 138.0f, 0.0f}                                },
+    {"RCalf", "RThigh",{0.0f, 360.0f, 0.0f}},
+    {"RFoot",  "RCalf",                              {0.0f, 345.0f, 0.0f}                                                                             },
+    {"RToe",  "RFoot",{0.0f, 62.0f, 130.0f}},
+};
 
 // A bone that points down along a direction and turns about the knee's hinge.
 Mat3 PointedAlong(const Vec3& direction, const Vec3& hinge)
@@ -35,28 +49,9 @@ Mat3 PointedAlong(const Vec3& direction, const Vec3& hinge)
     return rotation;
 }
 
-void Turn(CNode& node, const Mat3& world, const Mat3& parentWorld)
+void TurnTo(CNode& node, const Mat3& world, const Mat3& parentWorld)
 {
     node.m_kMatrix = Mat4Compose(world * Mat3Transpose(parentWorld), node.m_kMatrix.Translation());
-}
-
-void AppendKey(CNode& node, int frame)
-{
-    auto& track = *static_cast<CKeyframeControl*>(node.GetControl());
-    track.m_kKeyTimes.push_back(static_cast<float>(frame));
-    track.m_kRotationKeys.push_back(QuatFromMat3(NormalizedRows(node.m_kMatrix)));
-    track.m_kPositionKeys.push_back(node.m_kMatrix.Translation());
-    track.m_kScaleKeys.push_back(kVec3One);
-    track.m_fEndTime = static_cast<float>(frame);
-}
-
-void AttachTrack(CNode& node)
-{
-    auto* const track = new CKeyframeControl;
-    track->m_fFrequency = kWalkerSeconds;
-    track->m_kRestMatrix = node.m_kMatrix;
-    track->m_bHasRestMatrix = true;
-    node.AttachControl(track);
 }
 
 // How far a foot of the walk is in its cycle: it stands up to 0.6.
@@ -67,37 +62,18 @@ double PhaseOf(int side, int frame)
 
 } // namespace
 
-CWalker::CWalker() : m_spkRoot(AddBone(nullptr, "Hips", {0.0f, 88.0f, 0.0f}))
-{
-    for (const std::string side : kSides)
-    {
-        CNode* const thigh =
-            AddBone(m_spkRoot.Get(), side + "Hip", {side == "L" ? 9.0f : -9.0f, -4.0f, 0.0f});
-        CNode* const shin = AddBone(thigh, side + "Knee", {0.0f, -kUpper, 0.0f});
-        CNode* const foot = AddBone(shin, side + "Ankle", {0.0f, -kLower, 0.0f});
-        AddBone(foot, side + "Ball", {0.0f, -6.0f, 14.0f});
-    }
-    for (CNode* node : NodesOf(*m_spkRoot))
-        AttachTrack(*node);
-}
-
-CNode& CWalker::Bone(const std::string& name) const
-{
-    return *FindNode(m_spkRoot.Get(), name.c_str());
-}
+CWalker::CWalker() : CMadeFigure(kBones) {}
 
 void CWalker::Record(int frameCount, const std::function<Pose(int frame)>& pose)
 {
-    for (int frame = 0; frame < frameCount; ++frame)
-    {
+    const auto move = [&](CMadeFigure&, int frame) {
         const Pose at = pose(frame);
         const Mat3 pelvis = Mat3FromAxisAngle(kVec3UnitX, at.lean * kDegreesToRadians);
-        m_spkRoot->m_kMatrix = Mat4Compose(pelvis, at.hips + pelvis.Row(1) * 4.0f);
+        Root().m_kMatrix = Mat4Compose(pelvis, at.hips + pelvis.Row(1) * 4.0f);
         for (size_t side = 0; side < 2; ++side)
             PoseLeg(side, at, pelvis);
-        for (CNode* node : NodesOf(*m_spkRoot))
-            AppendKey(*node, frame);
-    }
+    };
+    CMadeFigure::Record(frameCount, move, kWalkerSeconds);
 }
 
 void CWalker::PoseLeg(size_t side, const Pose& pose, const Mat3& pelvis)
@@ -116,10 +92,10 @@ void CWalker::PoseLeg(size_t side, const Pose& pose, const Mat3& pelvis)
     const Mat3 thigh = PointedAlong(knee, -hinge);
     const Mat3 shin = PointedAlong(toAnkle - knee, -hinge);
     const std::string name = kSides[side];
-    Turn(Bone(name + "Hip"), thigh, pelvis);
-    Turn(Bone(name + "Knee"), shin, thigh);
-    Turn(Bone(name + "Ankle"), Mat3FromAxisAngle(kVec3UnitX, pose.footDegrees[side] * kDegreesToRadians),
-         shin);
+    TurnTo(Bone(name + "Hip"), thigh, pelvis);
+    TurnTo(Bone(name + "Knee"), shin, thigh);
+    TurnTo(Bone(name + "Ankle"), Mat3FromAxisAngle(kVec3UnitX, pose.footDegrees[side] * kDegreesToRadians),
+           shin);
 }
 
 CWalker::Pose WalkingPose(int frame)
@@ -150,16 +126,7 @@ bool WalkerStands(int side, int frame)
 
 Ref<CNode> MakeTargetLegs()
 {
-    Ref<CNode> root = AddBone(nullptr, "LowerTorso", {0.0f, 923.0f, 13.0f});
-    for (const std::string side : kSides)
-    {
-        CNode* const pelvis = AddBone(root.Get(), side + "Pelvis", kVec3Zero, 180.0f);
-        CNode* const thigh = AddBone(pelvis, side + "Thigh", {side == "L" ? -95.0f : 95.0f, 138.0f, 0.0f});
-        CNode* const foot =
-            AddBone(AddBone(thigh, side + "Calf", {0.0f, 360.0f, 0.0f}), side + "Foot", {0.0f, 345.0f, 0.0f});
-        AddBone(foot, side + "Toe", {0.0f, 62.0f, 130.0f});
-    }
-    return root;
+    return &CMadeFigure(kTargetLegs).Root();
 }
 
 void PairWalker(CRetargeter& retargeter, const CWalker& walker, CNode& target)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CNode.h"
+#include "CMadeFigure.h"
 #include "CRetargeter.h"
 
 #include <array>
@@ -13,7 +13,7 @@ inline constexpr float kWalkerSeconds = 1.0f / 30.0f; ///< from frame to frame
 
 /// A body in centimetres that is posed by where its hips and ankles are, so that a test knows which feet
 /// stand and what its knees do. Its legs are 45 + 37 long; a flat foot's ankle is 8 above the floor.
-class CWalker
+class CWalker : public CMadeFigure
 {
 public:
     /// Left and right, in this order.
@@ -30,14 +30,11 @@ public:
     };
 
     CWalker();
-    CNode& Root() const { return *m_spkRoot; }
-    CNode& Bone(const std::string& name) const;
     /// Gives every joint a track of so many frames.
     void Record(int frameCount, const std::function<Pose(int frame)>& pose);
 
 private:
     void PoseLeg(size_t side, const Pose& pose, const Mat3& pelvis);
-    Ref<CNode> m_spkRoot;
 };
 
 /// A walk of 70 cm in 36 frames.

@@ -3,10 +3,12 @@
 
 #include "Angles.h"
 #include "CKeyframeControl.h"
+#include "CMadeFigure.h"
 #include "CPoseMatcher.h"
 #include "CRetargeter.h"
 #include "CTriMesh.h"
 #include "Euler.h"
+#include "Rotations.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -24,51 +26,48 @@ namespace {
 constexpr float kFrequency = 1.0f / 30.0f;
 constexpr Vec3 kRootPosition{0, 923, 13};
 
-CNode* AddBone(CNode* parent, const char* name, const Vec3& offset, float degreesAboutZ = 0.0f)
-{
-    CNode* node = new CNode;
-    node->SetName(name);
-    node->m_kMatrix = Mat4Compose(EulerToMat3("ZYX", {0, 0, degreesAboutZ}), offset);
-    if (parent)
-        parent->AttachChild(node);
-    return node;
-}
-
 // A target of the fixed skeleton's make: legs below pelvis bones that are turned by half a turn.
-Ref<CNode> MakeTarget()
-{
-    Ref<CNode> root = AddBone(nullptr, "LowerTorso", kRootPosition);
-    CNode* waist = AddBone(root.Get(), "Waist", {0, 95, 0});
-    CNode* torso = AddBone(waist, "UpperTorso", {0, 150, 0});
-    AddBone(torso, "Neck", {0, 265, 0});
-    CNode* arm = AddBone(AddBone(torso, "LCollar", {25, 215, 0}, -90), "LUpperArm", {0, 145, 0});
-    AddBone(AddBone(arm, "LForearm", {0, 285, 0}), "LHand", {0, 255, 0});
-    for (const std::string side : {"L", "R"})
-    {
-        const float x = side == "L" ? -95.0f : 95.0f;
-        CNode* pelvis = AddBone(root.Get(), (side + "Pelvis").c_str(), kVec3Zero, 180);
-        CNode* thigh = AddBone(pelvis, (side + "Thigh").c_str(), {x, 138, 0});
-        AddBone(AddBone(thigh, (side + "Calf").c_str(), {0, 360, 0}), (side + "Foot").c_str(), {0, 345, 0});
-    }
-    return root;
-}
+constexpr MadeBone kTarget[] = {
+    {"LowerTorso",   "",           kRootPosition          },
+    {"Waist",        "LowerTorso", {0, 95, 0}             },
+    {"UpperTorso",   "Waist",      {0, 150, 0}            },
+    {"Neck",         "UpperTorso", {0, 265, 0}            },
+    {"LCollar",      "UpperTorso", {25, 215, 0},            -90},
+    {"LUpperArm",              "LCollar",                {0, 145, 0}                },
+    {"LForearm",              "LUpperArm",                 {0, 285, 0}},
+    {"LHand",              "LForearm",                    {0, 255, 0}                    },
+    {"LPelvis",              "LowerTorso",                  {0, 0, 0},180},
+    {"LThigh",           "LPelvis",                       {-95, 138, 0}                                           },
+    {"LCalf", "LThigh",{0, 360, 0}},
+    {"LFoot",   "LCalf",                         {0, 345, 0}                                                                             },
+    {"RPelvis",   "LowerTorso",{0, 0, 0},180},
+    {"RThigh",     "RPelvis",                        {95, 138, 0}                                                                                                                      },
+    {"RCalf", "RThigh",{0, 360, 0}},
+    {"RFoot",      "RCalf",                              {0, 345, 0}                                                                                                                                                                          },
+};
 
 // A source of other proportions and units, every joint's axes along the world's at rest.
-Ref<CNode> MakeSource()
+constexpr MadeBone kSource[] = {
+    {"Hips",       "",           {0, 92, 0} },
+    {"Spine",      "Hips",       {0, 12, 0} },
+    {"Spine1",     "Spine",      {0, 11, 0} },
+    {"Chest",      "Spine1",     {0, 14, 0} },
+    {"Neck",       "Chest",      {0, 26, 1} },
+    {"LeftCollar", "Chest",      {3, 22, 0} },
+    {"LeftArm",    "LeftCollar", {14, 0, 0} },
+    {"LeftElbow",  "LeftArm",    {28, 0, 0} },
+    {"LeftWrist",  "LeftElbow",  {25, 0, 0} },
+    {"LeftHip",    "Hips",       {9, -4, 0} },
+    {"LeftKnee",   "LeftHip",    {0, -43, 0}},
+    {"LeftAnkle",  "LeftKnee",   {0, -40, 0}},
+    {"RightHip",   "Hips",       {-9, -4, 0}},
+    {"RightKnee",  "RightHip",   {0, -43, 0}},
+    {"RightAnkle", "RightKnee",  {0, -40, 0}},
+};
+
+Ref<CNode> MakeTarget()
 {
-    Ref<CNode> root = AddBone(nullptr, "Hips", {0, 92, 0});
-    CNode* chest =
-        AddBone(AddBone(AddBone(root.Get(), "Spine", {0, 12, 0}), "Spine1", {0, 11, 0}), "Chest", {0, 14, 0});
-    AddBone(chest, "Neck", {0, 26, 1});
-    CNode* arm = AddBone(AddBone(chest, "LeftCollar", {3, 22, 0}), "LeftArm", {14, 0, 0});
-    AddBone(AddBone(arm, "LeftElbow", {28, 0, 0}), "LeftWrist", {25, 0, 0});
-    for (const std::string side : {"Left", "Right"})
-    {
-        const float x = side == "Left" ? 9.0f : -9.0f;
-        CNode* thigh = AddBone(root.Get(), (side + "Hip").c_str(), {x, -4, 0});
-        AddBone(AddBone(thigh, (side + "Knee").c_str(), {0, -43, 0}), (side + "Ankle").c_str(), {0, -40, 0});
-    }
-    return root;
+    return &CMadeFigure(kTarget).Root();
 }
 
 CKeyframeControl& TrackOf(CNode& node)
@@ -76,37 +75,25 @@ CKeyframeControl& TrackOf(CNode& node)
     return *RecordCast<CKeyframeControl>(node.GetControl());
 }
 
-// Gives every node a track of random but moderate rotations, and the root a path.
-void Animate(CNode& root, size_t frameCount)
+// A source whose bones turn at random but moderately, and whose root has a path.
+Ref<CNode> MakeSource(int frameCount)
 {
     std::mt19937 random(11);
     std::uniform_real_distribution<float> angle(-25.0f, 25.0f);
-    for (CNode* node : NodesOf(root))
-    {
-        CKeyframeControl* track = new CKeyframeControl;
-        track->m_fFrequency = kFrequency;
-        track->m_fEndTime = static_cast<float>(frameCount - 1);
-        track->m_kRestMatrix = node->m_kMatrix;
-        track->m_bHasRestMatrix = true;
-        for (size_t frame = 0; frame < frameCount; ++frame)
-        {
-            const float step = node == &root ? 3.0f * static_cast<float>(frame) : 0.0f;
-            track->m_kKeyTimes.push_back(static_cast<float>(frame));
-            track->m_kRotationKeys.push_back(
-                QuatFromMat3(EulerToMat3("ZXY", {angle(random), angle(random), angle(random)})));
-            track->m_kPositionKeys.push_back(node->m_kMatrix.Translation() +
-                                             Vec3{0.2f * step, -0.1f * step, step});
-            track->m_kScaleKeys.push_back(kVec3One);
-        }
-        node->AttachControl(track);
-    }
+    CMadeFigure figure(kSource);
+    const auto move = [&](CMadeFigure&, int frame) {
+        const float step = 3.0f * static_cast<float>(frame);
+        for (CNode* node : NodesOf(figure.Root()))
+            node->m_kMatrix = Mat4Compose(EulerToMat3("ZXY", {angle(random), angle(random), angle(random)}),
+                                          node->m_kMatrix.Translation());
+        figure.Move("Hips", {0.2f * step, -0.1f * step, step});
+    };
+    figure.Record(frameCount, move, kFrequency);
+    return &figure.Root();
 }
 
-const struct
-{
-    const char* source;
-    const char* target;
-} kMap[] = {
+const std::pair<const char*, const char*> kMap[] = {
+  // source and target
     {"Hips",       "LowerTorso"},
     {"Chest",      "UpperTorso"},
     {"Neck",       "Neck"      },
@@ -124,9 +111,7 @@ const struct
 
 double DegreesBetween(const Mat4& a, const Mat3& b)
 {
-    const Mat3 difference = NormalizedRows(a) * Mat3Transpose(b);
-    const double cosine = (difference.m[0] + difference.m[4] + difference.m[8] - 1.0) / 2.0;
-    return std::acos(std::clamp(cosine, -1.0, 1.0)) * kRadiansToDegrees64;
+    return DegreesBetween(NormalizedRows(a), b);
 }
 
 class CRetargeterTest : public ::testing::Test
@@ -134,17 +119,20 @@ class CRetargeterTest : public ::testing::Test
 protected:
     void SetUp() override
     {
-        m_kSource = MakeSource();
+        m_kSource = MakeSource(10);
         m_kTarget = MakeTarget();
-        Animate(*m_kSource, 10);
         m_kRetargeter.SetScenes(m_kSource.Get(), m_kTarget.Get());
-        for (const auto& row : kMap)
-            m_kRetargeter.SetSourceOf(Target(row.target), Source(row.source));
-        m_kRetargeter.SetFixed(Target("LPelvis"), true);
-        m_kRetargeter.SetFixed(Target("RPelvis"), true);
+        Map(m_kRetargeter);
+    }
+    void Map(CRetargeter& retargeter)
+    {
+        for (const auto& [source, target] : kMap)
+            retargeter.SetSourceOf(Target(target), Source(source));
+        retargeter.SetFixed(Target("LPelvis"), true);
+        retargeter.SetFixed(Target("RPelvis"), true);
         // Arms stand a quarter turn away, where the default decomposition has its flipped end.
         for (const char* arm : {"LCollar", "LUpperArm", "LForearm", "LHand"})
-            m_kRetargeter.SetShares(Target(arm), {1, 1, 2});
+            retargeter.SetShares(Target(arm), {1, 1, 2});
     }
     CNode* Source(const char* name) { return FindNode(m_kSource.Get(), name); }
     CNode* Target(const char* name) { return FindNode(m_kTarget.Get(), name); }
@@ -319,12 +307,7 @@ TEST_F(CRetargeterTest, LegsChangeThighsAndCalvesAndNothingElse)
     m_kTarget = MakeTarget();
     CRetargeter legs;
     legs.SetScenes(m_kSource.Get(), m_kTarget.Get());
-    for (const auto& row : kMap)
-        legs.SetSourceOf(Target(row.target), Source(row.source));
-    legs.SetFixed(Target("LPelvis"), true);
-    legs.SetFixed(Target("RPelvis"), true);
-    for (const char* arm : {"LCollar", "LUpperArm", "LForearm", "LHand"})
-        legs.SetShares(Target(arm), {1, 1, 2});
+    Map(legs);
     ASSERT_TRUE(legs.Retarget(0, 9, 0, kFrequency, kRootPosition, true, true));
     for (CNode* node : NodesOf(*m_kTarget))
     {

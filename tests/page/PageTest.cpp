@@ -1,10 +1,10 @@
 // What stands in a page, whatever the names and the numbers of a motion.
 
 #include "CConversionPage.h"
-#include "CMadeFigure.h"
 #include "CMarkup.h"
 #include "CPagePart.h"
 #include "ConvertedMotion.h"
+#include "PairedFigures.h"
 #include "TempFolder.h"
 
 #include <gtest/gtest.h>

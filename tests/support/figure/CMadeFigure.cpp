@@ -2,23 +2,15 @@
 
 #include "Angles.h"
 #include "CKeyframeControl.h"
+#include "MotionNode.h"
 #include "Skeleton.h"
-
-#include <cmath>
-#include <gtest/gtest.h>
 
 namespace gw {
 
 namespace {
 
-struct JointRow
-{
-    const char* name;
-    const char* parent;
-    Vec3 offset; // mm
-};
-
-constexpr JointRow kJoints[] = {
+constexpr MadeBone kPerson[] = {
+    {"LowerTorso", "",           {0.0f, 900.0f, 0.0f}   },
     {"LThigh",     "LowerTorso", {100.0f, 0.0f, 0.0f}   },
     {"LCalf",      "LThigh",     {0.0f, -400.0f, 0.0f}  },
     {"LFoot",      "LCalf",      {0.0f, -400.0f, 0.0f}  },
@@ -41,19 +33,6 @@ CKeyframeControl& TrackOf(const CNode& node)
     return *static_cast<CKeyframeControl*>(node.GetControl());
 }
 
-// A node with a track that holds its rest matrix.
-CNode* MakeBone(const std::string& name, const Vec3& offset)
-{
-    auto* const node = new CNode;
-    node->SetName(name.c_str());
-    node->m_kMatrix.SetTranslation(offset);
-    auto* const track = new CKeyframeControl;
-    track->m_kRestMatrix = node->m_kMatrix;
-    track->m_bHasRestMatrix = true;
-    node->AttachControl(track);
-    return node;
-}
-
 void AppendKey(const CNode& node, int frame)
 {
     CKeyframeControl& track = TrackOf(node);
@@ -65,11 +44,17 @@ void AppendKey(const CNode& node, int frame)
 
 } // namespace
 
-CMadeFigure::CMadeFigure(double unit) : m_fUnit(static_cast<float>(unit))
+CMadeFigure::CMadeFigure(double unit) : CMadeFigure(kPerson, unit) {}
+
+CMadeFigure::CMadeFigure(std::span<const MadeBone> bones, double unit) : m_fUnit(static_cast<float>(unit))
 {
-    m_spkRoot = MakeBone("LowerTorso", Vec3{0.0f, 900.0f, 0.0f} * m_fUnit);
-    for (const JointRow& row : kJoints)
-        AddBone(row.name, row.parent, row.offset);
+    for (const auto& [name, parent, offset, degreesZ] : bones)
+        AddBone(name, parent, offset, degreesZ);
+}
+
+bool CMadeFigure::HasBone(const std::string& name) const
+{
+    return FindNode(m_spkRoot.Get(), name.c_str());
 }
 
 CNode& CMadeFigure::Bone(const std::string& name) const
@@ -77,10 +62,17 @@ CNode& CMadeFigure::Bone(const std::string& name) const
     return *FindNode(m_spkRoot.Get(), name.c_str());
 }
 
-CNode& CMadeFigure::AddBone(const std::string& name, const std::string& parent, const Vec3& offset)
+CNode& CMadeFigure::AddBone(const std::string& name, const std::string& parent, const Vec3& offset,
+                            double degreesZ)
 {
-    CNode* const bone = MakeBone(name, offset * m_fUnit);
-    Bone(parent).AttachChild(bone);
+    CNode* bone = nullptr;
+    if (parent.empty())
+        m_spkRoot = bone = new CNode;
+    else
+        bone = &AttachNode(Bone(parent));
+    bone->SetName(name.c_str());
+    const auto radians = static_cast<float>(degreesZ * kDegreesToRadians64);
+    bone->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitZ, radians), offset * m_fUnit);
     return *bone;
 }
 
@@ -103,45 +95,26 @@ void CMadeFigure::Move(const std::string& name, const Vec3& offset)
     matrix.SetTranslation(matrix.Translation() + offset * m_fUnit);
 }
 
-std::vector<CNode*> CMadeFigure::Bones() const
+CMadeFigure::Recorded
+CMadeFigure::Record(int frameCount, const std::function<void(CMadeFigure&, int frame)>& pose, float frequency)
 {
-    return NodesOf(*m_spkRoot);
-}
-
-MotionClip CMadeFigure::Record(int frameCount, const std::function<void(CMadeFigure&, int frame)>& pose,
-                               float frequency)
-{
+    const std::vector<CNode*> bones = NodesOf(*m_spkRoot);
+    for (CNode* bone : bones)
+    {
+        if (!bone->GetControl())
+            AttachTrack(*bone, 0, frequency, bone->m_kMatrix);
+    }
     for (int frame = 0; frame < frameCount; ++frame)
     {
-        for (CNode* bone : Bones())
+        for (CNode* bone : bones)
             bone->m_kMatrix = TrackOf(*bone).m_kRestMatrix;
         pose(*this, frame);
-        for (CNode* bone : Bones())
+        for (const CNode* bone : bones)
             AppendKey(*bone, frame);
     }
-    for (CNode* bone : Bones())
-    {
-        TrackOf(*bone).m_fFrequency = frequency;
+    for (const CNode* bone : bones)
         TrackOf(*bone).m_fEndTime = static_cast<float>(frameCount - 1);
-    }
     return {m_spkRoot.Get(), frequency, frameCount};
-}
-
-void ExpectMeasured(double figure, double putIn)
-{
-    EXPECT_NEAR(figure, putIn, putIn == 0.0 ? 1e-3 : std::fabs(putIn) * 0.01);
-}
-
-std::vector<BonePair> PairByName(const CMadeFigure& source, const CMadeFigure& result)
-{
-    CNode* const sourceRoot = &source.Bone("LowerTorso");
-    std::vector<BonePair> pairs;
-    for (CNode* target : NodesOf(result.Bone("LowerTorso")))
-    {
-        if (CNode* bone = FindNode(sourceRoot, target->GetName()))
-            pairs.push_back({target, bone});
-    }
-    return pairs;
 }
 
 } // namespace gw
