@@ -1,11 +1,10 @@
 #include "MadeWalk.h"
 
 #include "Angles.h"
-#include "Vec3.h"
+#include "CMadeText.h"
 
 #include <algorithm>
 #include <cmath>
-#include <cstdio>
 #include <gtest/gtest.h>
 #include <vector>
 
@@ -50,113 +49,33 @@ constexpr JointRow kJoints[] = {
     {"Neck",          3, {0.0f, 22.0f, 0.0f},  1.0,    0.4},
     {"Head",          4, {0.0f, 10.0f, 1.0f},  1.0,    0.8},
 };
-constexpr Vec3 kEnd{0.0f, 6.0f, 0.0f};
 
-class CWalkText
+// A leg swings evenly, so that the foot on the ground stands while the hip goes on.
+double Wave(double strides)
 {
-public:
-    explicit CWalkText(const WalkStyle& style) : style_(style)
-    {
-        if (style.rootBelow)
-            m_kJoints.push_back({"Reference", -1, kVec3Zero, 0.0, 0.0});
-        for (const JointRow& joint : kJoints)
-        {
-            if (style.toes || !std::string_view(joint.name).ends_with("ToeBase"))
-                m_kJoints.push_back(joint);
-        }
-        if (style.hipOffset)
-            m_kJoints.front().offset.y = kHipHeight;
-    }
+    return std::asin(std::sin(2.0 * kPi64 * strides)) / kHalfPi64;
+}
 
-    std::string Run()
-    {
-        Line(0, "HIERARCHY");
-        for (size_t i = 0; i < m_kJoints.size(); ++i)
-            AppendJoint(i);
-        Line(0, "MOTION");
-        Line(0, "Frames: " + std::to_string(style_.frames));
-        Line(0, "Frame Time: " + Number(1.0 / style_.declaredRate));
-        for (int frame = 0; frame < style_.frames; ++frame)
-            AppendRow(frame / style_.rate);
-        return m_kText;
-    }
+Vec3 HipAt(double seconds)
+{
+    const double step = 2.0 * kLeg * std::sin(kSwing * kDegreesToRadians64);
+    return {0.0f, kHipHeight, static_cast<float>(2.0 * step * seconds / kStrideSeconds)};
+}
 
-private:
-    int DepthOf(size_t joint) const { return m_kJoints[joint].depth + (style_.rootBelow ? 1 : 0); }
-    bool HasPositions(size_t joint) const
+std::vector<JointRow> JointsOf(const WalkStyle& style)
+{
+    std::vector<JointRow> joints;
+    if (style.rootBelow)
+        joints.push_back({"Reference", -1, kVec3Zero, 0.0, 0.0});
+    for (const JointRow& joint : kJoints)
     {
-        return DepthOf(joint) <= (style_.rootBelow ? 1 : 0) || style_.sixChannels || style_.repeatsOffsets;
+        if (style.toes || !std::string_view(joint.name).ends_with("ToeBase"))
+            joints.push_back(joint);
     }
-
-    void Line(int depth, const std::string& words)
-    {
-        m_kText += std::string(static_cast<size_t>(depth), '\t') + words + '\n';
-    }
-    std::string Number(double number) const
-    {
-        char text[40];
-        std::snprintf(text, sizeof(text), style_.scientific ? "%.7e" : "%.6f", number);
-        return text;
-    }
-    std::string Numbers(const Vec3& v) const
-    {
-        const Vec3 up = (style_.zUp ? Vec3{v.x, -v.z, v.y} : v) * style_.unit;
-        return Number(up.x) + ' ' + Number(up.y) + ' ' + Number(up.z);
-    }
-
-    void AppendJoint(size_t joint)
-    {
-        const int depth = DepthOf(joint);
-        Line(depth, (joint == 0 ? "ROOT " : "JOINT ") + std::string(m_kJoints[joint].name));
-        Line(depth, "{");
-        Line(depth + 1, "OFFSET " + Numbers(m_kJoints[joint].offset));
-        Line(depth + 1, HasPositions(joint)
-                            ? "CHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation"
-                            : "CHANNELS 3 Zrotation Xrotation Yrotation");
-        const int next = joint + 1 < m_kJoints.size() ? DepthOf(joint + 1) : 0;
-        if (next <= depth)
-            AppendEnd(depth + 1);
-        for (int open = depth; open >= next && (open > 0 || joint + 1 == m_kJoints.size()); --open)
-            Line(open, "}");
-    }
-    void AppendEnd(int depth)
-    {
-        Line(depth, "End Site");
-        Line(depth, "{");
-        Line(depth + 1, "OFFSET " + Numbers(kEnd));
-        Line(depth, "}");
-    }
-
-    // A leg swings evenly, so that the foot on the ground stands while the hip goes on.
-    static double Wave(double strides) { return std::asin(std::sin(2.0 * kPi64 * strides)) / kHalfPi64; }
-    Vec3 HipAt(double seconds) const
-    {
-        const double step = 2.0 * kLeg * std::sin(kSwing * kDegreesToRadians64);
-        return {0.0f, kHipHeight, static_cast<float>(2.0 * step * seconds / kStrideSeconds)};
-    }
-    void AppendRow(double seconds)
-    {
-        std::string row;
-        for (size_t joint = 0; joint < m_kJoints.size(); ++joint)
-        {
-            const bool hip = m_kJoints[joint].name == std::string_view("Hips");
-            const Vec3 position = hip                     ? HipAt(seconds)
-                                  : style_.repeatsOffsets ? m_kJoints[joint].offset
-                                                          : kVec3Zero;
-            if (HasPositions(joint))
-                row += Numbers(position) + ' ';
-            const double turn =
-                m_kJoints[joint].turn * Wave(seconds / kStrideSeconds + m_kJoints[joint].onset);
-            row += Number(0.0) + ' ' + Number(turn) + ' ' + Number(0.0) + ' ';
-        }
-        row.pop_back();
-        Line(0, row);
-    }
-
-    const WalkStyle& style_;
-    std::vector<JointRow> m_kJoints;
-    std::string m_kText;
-};
+    if (style.hipOffset)
+        joints.front().offset.y = kHipHeight;
+    return joints;
+}
 
 // Where a line begins; the end of the text for one behind it.
 size_t BeginOf(std::string_view text, size_t number)
@@ -179,7 +98,32 @@ size_t BeginOfValue(std::string_view row, size_t column)
 
 std::string MadeWalk(const WalkStyle& style)
 {
-    return CWalkText(style).Run();
+    const auto written = [&](const Vec3& v) { return (style.zUp ? Vec3{v.x, -v.z, v.y} : v) * style.unit; };
+    const std::vector<JointRow> rows = JointsOf(style);
+    std::vector<TextJoint> joints;
+    for (const JointRow& row : rows)
+    {
+        // The joint before that stands one step higher.
+        const auto isAbove = [&](const JointRow& other) { return other.depth == row.depth - 1; };
+        const auto above =
+            std::find_if(rows.rend() - static_cast<ptrdiff_t>(joints.size()), rows.rend(), isAbove);
+        joints.push_back({row.name, static_cast<int>(rows.rend() - above) - 1, written(row.offset),
+                          written({0.0f, 6.0f, 0.0f}),
+                          row.depth == 0 || style.sixChannels || style.repeatsOffsets});
+    }
+    const auto key = [&](size_t joint, int frame) {
+        const JointRow& row = rows[joint];
+        const double seconds = frame / style.rate;
+        const bool isHip = row.name == std::string_view("Hips");
+        const Vec3 position = isHip ? HipAt(seconds) : style.repeatsOffsets ? row.offset : kVec3Zero;
+        const double turn = row.turn * Wave(seconds / kStrideSeconds + row.onset);
+        return TextKey{
+            written(position), {static_cast<float>(turn), 0.0f, 0.0f}
+        };
+    };
+    CMadeText text(std::move(joints));
+    text.m_bScientific = style.scientific;
+    return text.Write(style.frames, 1.0 / style.declaredRate, key);
 }
 
 std::string Replaced(std::string text, std::string_view part, std::string_view instead,

@@ -20,11 +20,6 @@ std::vector<std::string> Words(std::string_view text)
     return words;
 }
 
-std::string OffsetText(float x, float y, float z)
-{
-    return "OFFSET " + std::to_string(x) + ' ' + std::to_string(y) + ' ' + std::to_string(z) + '\n';
-}
-
 } // namespace
 
 CNamedBody::CNamedBody(const Convention& convention, const BodyChange& change)
@@ -32,7 +27,13 @@ CNamedBody::CNamedBody(const Convention& convention, const BodyChange& change)
 {
     AddTrunk();
     const CTempFolder folder;
-    WriteBytes(folder.Path("body.bvh"), Text());
+    const auto key = [](size_t joint, int) {
+        return TextKey{
+            {0.0f, joint == 0 ? 95.0f : 0.0f, 0.0f},
+            kVec3Zero
+        };
+    };
+    WriteBytes(folder.Path("body.bvh"), CMadeText(m_kJoints).Write(2, 1.0 / 30.0, key));
     EXPECT_TRUE(m_kMotion.Load(folder.Path("body.bvh"))) << convention.what << ", " << change.what;
 }
 
@@ -57,7 +58,12 @@ std::string CNamedBody::NameFor(std::string name, float side) const
 
 int CNamedBody::Add(int parent, const std::string& name, std::string_view targets, float x, float y, float z)
 {
-    m_kJoints.push_back({name, parent, x, y, z});
+    // A shin's end is the ankle, and the foot goes on in front of it; everything else goes on as it came.
+    const Vec3 tip = y < -30.0f ? Vec3{0.0f, -7.0f, 13.0f} : Vec3{x / 2.0f, y, z};
+    m_kJoints.push_back({
+        name, parent, {x, y, z},
+          tip
+    });
     m_kTargets[name] = targets;
     return static_cast<int>(m_kJoints.size()) - 1;
 }
@@ -138,44 +144,6 @@ void CNamedBody::AddLeg(float side)
             joint = Add(joint, NameFor(names[i], side), *kBones[i] ? letter + kBones[i] : "",
                         i == 1 ? side * 9.0f : 0.0f, kDown[i], i == 4 ? 13.0f : 0.0f);
     }
-}
-
-// A foot ends in front of the ankle, everything else goes on as it came.
-void CNamedBody::WriteJoint(std::string& text, size_t joint) const
-{
-    const Joint& self = m_kJoints[joint];
-    text += (joint == 0 ? "ROOT " : "JOINT ") + self.name + "\n{\n" + OffsetText(self.x, self.y, self.z);
-    text += joint == 0 ? "CHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation\n"
-                       : "CHANNELS 3 Zrotation Xrotation Yrotation\n";
-    bool isEnd = true;
-    for (size_t child = joint + 1; child < m_kJoints.size(); ++child)
-    {
-        if (m_kJoints[child].parent != static_cast<int>(joint))
-            continue;
-        WriteJoint(text, child);
-        isEnd = false;
-    }
-    const bool isAnkle = self.y < -30.0f;
-    if (isEnd)
-        text += "End Site\n{\n" +
-                (isAnkle ? OffsetText(0.0f, -7.0f, 13.0f) : OffsetText(self.x / 2.0f, self.y, self.z)) +
-                "}\n";
-    text += "}\n";
-}
-
-std::string CNamedBody::Text() const
-{
-    std::string text = "HIERARCHY\n";
-    WriteJoint(text, 0);
-    text += "MOTION\nFrames: 2\nFrame Time: 0.0333333\n";
-    for (int frame = 0; frame < 2; ++frame)
-    {
-        text += "0 95 0";
-        for (size_t i = 0; i < m_kJoints.size(); ++i)
-            text += " 0 0 0";
-        text += '\n';
-    }
-    return text;
 }
 
 } // namespace gw

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CMadeText.h"
 #include "CMotionFile.h"
 
 #include <map>
@@ -58,13 +59,6 @@ public:
     bool MayDrive(const std::string& target, std::string_view joint) const;
 
 private:
-    struct Joint
-    {
-        std::string name;
-        int parent;
-        float x, y, z; ///< from the parent
-    };
-
     int Add(int parent, const std::string& name, std::string_view targets, float x, float y, float z);
     void AddTrunk();
     void AddHead(int chest);
@@ -72,12 +66,10 @@ private:
     void AddHand(int hand, float side);
     void AddLeg(float side);
     std::string NameFor(std::string name, float side) const;
-    void WriteJoint(std::string& text, size_t joint) const;
-    std::string Text() const;
 
     const Convention& convention_;
     BodyChange m_kChange;
-    std::vector<Joint> m_kJoints;
+    std::vector<TextJoint> m_kJoints;
     std::map<std::string, std::string> m_kTargets; ///< the targets that a joint may drive, in words
     CMotionFile m_kMotion;
 };

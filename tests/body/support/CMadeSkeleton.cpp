@@ -48,11 +48,6 @@ Mat3 Turn(const Vec3& degrees)
     return about(kVec3UnitX, degrees.x) * about(kVec3UnitY, degrees.y) * about(kVec3UnitZ, degrees.z);
 }
 
-std::string Numbers(const Vec3& v)
-{
-    return std::to_string(v.x) + ' ' + std::to_string(v.y) + ' ' + std::to_string(v.z);
-}
-
 } // namespace
 
 CMadeSkeleton::CMadeSkeleton(std::string_view recipe, unsigned seed) : m_kRecipe(recipe), m_kRandom(seed)
@@ -290,22 +285,18 @@ Vec3 CMadeSkeleton::OffsetOf(const Joint& joint) const
     return Through(World(joint.place - joint.parent->place), Mat3Transpose(joint.parent->world));
 }
 
-void CMadeSkeleton::WriteJoint(std::string& text, const Joint& joint, bool isRoot) const
+void CMadeSkeleton::AppendJoints(std::vector<TextJoint>& joints, const Joint& joint, int parent) const
 {
-    text += (isRoot ? "ROOT " : "JOINT ") + joint.name + "\n{\nOFFSET " + Numbers(OffsetOf(joint));
-    text += isRoot ? "\nCHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation\n"
-                   : "\nCHANNELS 3 Zrotation Xrotation Yrotation\n";
+    const auto self = static_cast<int>(joints.size());
+    const Vec3 tip = Through(World(joint.tip), Mat3Transpose(joint.world));
+    joints.push_back({joint.name, parent, OffsetOf(joint), tip});
     for (const auto& child : joint.children)
-        WriteJoint(text, *child, false);
-    if (joint.children.empty())
-        text +=
-            "End Site\n{\nOFFSET " + Numbers(Through(World(joint.tip), Mat3Transpose(joint.world))) + "\n}\n";
-    text += "}\n";
+        AppendJoints(joints, *child, self);
 }
 
 // The angles of a joint and of those below it, in a step of the walk; legs and arms swing about the x of the
 // stance, knees only backward.
-void CMadeSkeleton::AppendRotations(std::string& row, const Joint& joint, const Mat3& parentTurn,
+void CMadeSkeleton::AppendRotations(std::vector<Vec3>& degrees, const Joint& joint, const Mat3& parentTurn,
                                     double phase) const
 {
     const double swing = Has("walk") ? std::sin(phase) : 0.0;
@@ -328,24 +319,25 @@ void CMadeSkeleton::AppendRotations(std::string& row, const Joint& joint, const 
     Mat3ToEuler(local, static_cast<int>(EEulerOrder::ZXY), angles.x, angles.y, angles.z);
     if (Has("rest"))
         angles = kVec3Zero;
-    row += Numbers(Vec3{angles.z, angles.x, angles.y} * (1.0f / kDegreesToRadians)) + ' ';
+    degrees.push_back(angles * (1.0f / kDegreesToRadians));
     for (const auto& child : joint.children)
-        AppendRotations(row, *child, world, phase);
+        AppendRotations(degrees, *child, world, phase);
 }
 
 std::string CMadeSkeleton::Text() const
 {
-    std::string text = "HIERARCHY\n";
-    WriteJoint(text, *m_spkRoot, true);
-    const int frames = Has("walk") ? 24 : 1;
-    text += "MOTION\nFrames: " + std::to_string(frames) + "\nFrame Time: 0.04\n";
-    for (int frame = 0; frame < frames; ++frame)
-    {
-        text += Numbers(World(m_spkRoot->place)) + ' ';
-        AppendRotations(text, *m_spkRoot, kMat3Identity, 0.5 * frame);
-        text += '\n';
-    }
-    return text;
+    std::vector<TextJoint> joints;
+    AppendJoints(joints, *m_spkRoot, -1);
+    std::vector<Vec3> degrees; // of a frame, joint by joint
+    const auto key = [&](size_t joint, int frame) {
+        if (joint == 0)
+        {
+            degrees.clear();
+            AppendRotations(degrees, *m_spkRoot, kMat3Identity, 0.5 * frame);
+        }
+        return TextKey{joint == 0 ? World(m_spkRoot->place) : kVec3Zero, degrees[joint]};
+    };
+    return CMadeText(std::move(joints)).Write(Has("walk") ? 24 : 1, 0.04, key);
 }
 
 std::vector<std::string> SkeletonRecipes()

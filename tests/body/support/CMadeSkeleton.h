@@ -1,6 +1,7 @@
 #pragma once
 
 #include "BodyJoints.h"
+#include "CMadeText.h"
 #include "CMotionFile.h"
 #include "Mat3.h"
 
@@ -71,8 +72,9 @@ private:
     void TurnFrames(Joint& joint);
     Vec3 World(const Vec3& place) const;
     Vec3 OffsetOf(const Joint& joint) const;
-    void WriteJoint(std::string& text, const Joint& joint, bool isRoot) const;
-    void AppendRotations(std::string& row, const Joint& joint, const Mat3& parentTurn, double phase) const;
+    void AppendJoints(std::vector<TextJoint>& joints, const Joint& joint, int parent) const;
+    void AppendRotations(std::vector<Vec3>& degrees, const Joint& joint, const Mat3& parentTurn,
+                         double phase) const;
     std::string Text() const;
 
     std::string m_kRecipe;
