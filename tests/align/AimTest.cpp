@@ -22,19 +22,13 @@ namespace {
 
 // A target as the host has it: bones along their own Y.
 constexpr MadeBone kBones[] = {
-    {"LowerTorso", "",           {0, 923, 13},  0  },
-    {"Waist",      "LowerTorso", {0, 95, 0},    0  },
-    {"UpperTorso", "Waist",      {0, 150, 0},   0  },
-    {"Neck",       "UpperTorso", {0, 265, 0},   0  },
-    {"Head",       "Neck",       {0, 95, 0},    0  },
-    {"LCollar",    "UpperTorso", {25, 215, 0},  -90},
-    {"LUpperArm",  "LCollar",    {0, 145, 0},   0  },
-    {"LForearm",   "LUpperArm",  {0, 285, 0},   0  },
-    {"LHand",      "LForearm",   {0, 255, 0},   0  },
-    {"LPelvis",    "LowerTorso", {0, 0, 0},     180},
-    {"LThigh",     "LPelvis",    {-95, 138, 0}, 0  },
-    {"LCalf",      "LThigh",     {0, 360, 0},   0  },
-    {"LFoot",      "LCalf",      {0, 345, 0},   0  },
+    {"LowerTorso", "", {0, 923, 13}, 0},      {"Waist", "LowerTorso", {0, 95, 0}, 0},
+    {"UpperTorso", "Waist", {0, 150, 0}, 0},  {"Neck", "UpperTorso", {0, 265, 0}, 0},
+    {"Head", "Neck", {0, 95, 0}, 0},          {"LCollar", "UpperTorso", {25, 215, 0}, -90},
+    {"LUpperArm", "LCollar", {0, 145, 0}, 0}, {"LForearm", "LUpperArm", {0, 285, 0}, 0},
+    {"LHand", "LForearm", {0, 255, 0}, 0},    {"LPelvis", "LowerTorso", {0, 0, 0}, 180},
+    {"LThigh", "LPelvis", {-95, 138, 0}, 0},  {"LCalf", "LThigh", {0, 360, 0}, 0},
+    {"LFoot", "LCalf", {0, 345, 0}, 0},
 };
 
 class CTarget : public CMadeFigure

@@ -94,19 +94,19 @@ std::vector<TellingRow> Tellings()
     const Turn standing = Everywhere(zUp);
     const Turn back = Everywhere(TurnAbout(kVec3UnitY, 180.0));
     return {
-        {"a T-pose already",            straight,    none, 0.1 },
-        {"an A-pose",                   spread,      none, 0.1 },
-        {"arms that hang",              down,        none, 0.1 },
-        {"a rest pose with Z up",       standing,    none, 0.1 },
-        {"a motion with Z up",          standing,    zUp,  0.1 },
-        {"Z up in the motion alone",    straight,    zUp,  0.1 },
-        {"a rest pose that faces back", back,        none, 0.1 },
-        {"bones along X",               AlongX,      none, 12.0},
-        {"bones along X, with Z up",    AlongX,      zUp,  12.0},
-        {"slanted shins",               Slanted,     none, 0.1 },
-        {"knees that bend to the side", TurnedKnees, none, 2.0 },
-        {"a hand rolled at rest",       RolledHand,  none, 0.1 },
-        {"feet that hang at rest",      HangingFeet, none, 1.0 },
+        {"a T-pose already", straight, none, 0.1},
+        {"an A-pose", spread, none, 0.1},
+        {"arms that hang", down, none, 0.1},
+        {"a rest pose with Z up", standing, none, 0.1},
+        {"a motion with Z up", standing, zUp, 0.1},
+        {"Z up in the motion alone", straight, zUp, 0.1},
+        {"a rest pose that faces back", back, none, 0.1},
+        {"bones along X", AlongX, none, 12.0},
+        {"bones along X, with Z up", AlongX, zUp, 12.0},
+        {"slanted shins", Slanted, none, 0.1},
+        {"knees that bend to the side", TurnedKnees, none, 2.0},
+        {"a hand rolled at rest", RolledHand, none, 0.1},
+        {"feet that hang at rest", HangingFeet, none, 1.0},
     };
 }
 
@@ -189,18 +189,12 @@ TEST(AlignMotion, LaysEveryLimbAlongItsAxisAtRest)
         const CMadeBody told = Made(row);
         const AlignedMotion aligned = Align(told);
         const std::tuple<const char*, const char*, Vec3> bones[] = {
-            {"LowerTorso", "Waist",     kVec3UnitY },
-            {"UpperTorso", "Neck",      kVec3UnitY },
-            {"Neck",       "Head",      kVec3UnitY },
-            {"LCollar",    "LUpperArm", kVec3UnitX },
-            {"LUpperArm",  "LForearm",  kVec3UnitX },
-            {"LForearm",   "LHand",     kVec3UnitX },
-            {"LHand",      "LMiddle",   kVec3UnitX },
-            {"RUpperArm",  "RForearm",  -kVec3UnitX},
-            {"RForearm",   "RHand",     -kVec3UnitX},
-            {"LThigh",     "LCalf",     -kVec3UnitY},
-            {"LCalf",      "LFoot",     -kVec3UnitY},
-            {"RCalf",      "RFoot",     -kVec3UnitY},
+            {"LowerTorso", "Waist", kVec3UnitY},   {"UpperTorso", "Neck", kVec3UnitY},
+            {"Neck", "Head", kVec3UnitY},          {"LCollar", "LUpperArm", kVec3UnitX},
+            {"LUpperArm", "LForearm", kVec3UnitX}, {"LForearm", "LHand", kVec3UnitX},
+            {"LHand", "LMiddle", kVec3UnitX},      {"RUpperArm", "RForearm", -kVec3UnitX},
+            {"RForearm", "RHand", -kVec3UnitX},    {"LThigh", "LCalf", -kVec3UnitY},
+            {"LCalf", "LFoot", -kVec3UnitY},       {"RCalf", "RFoot", -kVec3UnitY},
         };
         for (const auto& [from, to, axis] : bones)
         {
@@ -285,12 +279,12 @@ TEST(AlignMotion, KeepsPositionsThatVary)
 TEST(AlignMotion, WorksOnBodiesThatLackJointsAndOnSinglePoses)
 {
     const std::tuple<const char*, std::vector<std::string>, int> rows[] = {
-        {"no hands",            {"LHand", "RHand"},                         40},
-        {"no fingers",          {"LThumb", "LIndex", "LMiddle", "LLittle"}, 40},
-        {"no toes",             {"LToe", "RToe"},                           40},
-        {"no neck and no head", {"Neck"},                                   40},
-        {"one pose",            {},                                         1 },
-        {"no pose",             {},                                         0 },
+        {"no hands", {"LHand", "RHand"}, 40},
+        {"no fingers", {"LThumb", "LIndex", "LMiddle", "LLittle"}, 40},
+        {"no toes", {"LToe", "RToe"}, 40},
+        {"no neck and no head", {"Neck"}, 40},
+        {"one pose", {}, 1},
+        {"no pose", {}, 0},
     };
     for (const auto& [what, without, frameCount] : rows)
     {

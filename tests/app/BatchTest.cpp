@@ -71,13 +71,13 @@ TEST_F(BatchTest, Runs)
         int job;
         int answer;
     } rows[] = {
-        {"all good",                 "a.bvh b.BVH c.bvh",  "Poser", "146",                                 "3 ", "a.htr b.htr c.htr",       "",                          1, 1},
-        {"no file of the kind",      "a.htr",              "Poser", "",                                    "",   "a.htr",                   "",                          1, 0},
-        {"one broken",               "a.bvh b.bvh! c.bvh", "Poser", "missing-section HIERARCHY, 138, 146", "1 ", "a.htr",
-         "",                                                                                                                                                             1, 1},
-        {"no profile selected",      "a.bvh",              "",      "no-profile, 144",                     "",   "",                        " - Batch Converting 1 : a", 1, 0},
-        {"one cannot be written",    "a.bvh b.bvh b.htr/", "Poser", "write-error, 146",                    "1 ", "a.htr",                   "",                          1, 1},
-        {"packages need no profile", "a.htr b.HTR!",       "",      "148",                                 "2 ", "a.htr a.orn b.HTR b.orn", "",                          2, 1},
+        {"all good", "a.bvh b.BVH c.bvh", "Poser", "146", "3 ", "a.htr b.htr c.htr", "", 1, 1},
+        {"no file of the kind", "a.htr", "Poser", "", "", "a.htr", "", 1, 0},
+        {"one broken", "a.bvh b.bvh! c.bvh", "Poser", "missing-section HIERARCHY, 138, 146", "1 ", "a.htr",
+         "", 1, 1},
+        {"no profile selected", "a.bvh", "", "no-profile, 144", "", "", " - Batch Converting 1 : a", 1, 0},
+        {"one cannot be written", "a.bvh b.bvh b.htr/", "Poser", "write-error, 146", "1 ", "a.htr", "", 1, 1},
+        {"packages need no profile", "a.htr b.HTR!", "", "148", "2 ", "a.htr a.orn b.HTR b.orn", "", 2, 1},
     };
     for (const auto& row : rows)
     {

@@ -16,14 +16,9 @@ TEST_F(ContentTest, Clicks)
     m_kWindow.m_kAnswers[171] = EAnswer::Cancel;
     OpenAndConvert();
     const std::tuple<const char*, Calls, bool> rows[] = {
-        {"close",    {"close"},          false},
-        {"EXIT",     {"close"},          false},
-        {"play",     {"timer 0 17"},     true },
-        {"play1",    {"timer 1 100"},    true },
-        {"PreFrm1",  {},                 true },
-        {"NextFrm1", {},                 true },
-        {"apply",    {"save *.Kinetra"}, true },
-        {"nothing",  {},                 true },
+        {"close", {"close"}, false},         {"EXIT", {"close"}, false}, {"play", {"timer 0 17"}, true},
+        {"play1", {"timer 1 100"}, true},    {"PreFrm1", {}, true},      {"NextFrm1", {}, true},
+        {"apply", {"save *.Kinetra"}, true}, {"nothing", {}, true},
     };
     for (const auto& [child, calls, passedOn] : rows)
     {
@@ -120,9 +115,7 @@ TEST_F(ContentTest, HelpIsTheHostsFileOrAPage)
     EXPECT_EQ(click(), Calls{page}) << "a host without its library";
     Write("host/Kbel.dll", ResourceFile({}));
     EXPECT_EQ(click(), Calls{"help ::/Using_Gaitwright.htm"}) << "a library that names no file";
-    Write("host/Kbel.dll", ResourceFile({
-                               {32824, 0, "Kestro.chm"}
-    }));
+    Write("host/Kbel.dll", ResourceFile({{32824, 0, "Kestro.chm"}}));
     EXPECT_EQ(click(), Calls{page}) << "a file that is not there";
     Write("host/Kestro.chm", "");
     EXPECT_EQ(click(), Calls{"help " + m_kFolder.Path("host/Kestro.chm::/Using_Gaitwright.htm")});

@@ -16,17 +16,17 @@ TEST(FolderText, NamesAFolderByBothSeparators)
         const char* text;
         const char* folder; // null for none
     } rows[] = {
-        {"nothing is the open folder",            "",                 "/home/ann/"            },
-        {"the open folder itself",                "/home/ann",        "/home/ann/"            },
-        {"a separator at the end goes and comes", "/takes/",          "/takes/"               },
-        {"the other separator",                   "\\takes\\day 1\\", "/takes/day 1/"         },
-        {"the root",                              "/",                "/"                     },
-        {"a name in the open folder",             "takes/day 1",      "/home/ann/takes/day 1/"},
-        {"two backslashes in a row",              "/takes\\\\day",    nullptr                 },
-        {"two backslashes at the end",            "/takes\\\\",       nullptr                 },
-        {"two slashes in a row",                  "//takes",          nullptr                 },
-        {"one of each",                           "/takes/\\day",     nullptr                 },
-        {"only the two",                          "\\\\",             nullptr                 },
+        {"nothing is the open folder", "", "/home/ann/"},
+        {"the open folder itself", "/home/ann", "/home/ann/"},
+        {"a separator at the end goes and comes", "/takes/", "/takes/"},
+        {"the other separator", "\\takes\\day 1\\", "/takes/day 1/"},
+        {"the root", "/", "/"},
+        {"a name in the open folder", "takes/day 1", "/home/ann/takes/day 1/"},
+        {"two backslashes in a row", "/takes\\\\day", nullptr},
+        {"two backslashes at the end", "/takes\\\\", nullptr},
+        {"two slashes in a row", "//takes", nullptr},
+        {"one of each", "/takes/\\day", nullptr},
+        {"only the two", "\\\\", nullptr},
     };
     for (const auto& row : rows)
     {

@@ -23,24 +23,24 @@ TEST(IniText, Values)
         const char* text;
         const char* value; // of Settings/Window Pos; null when there is none
     } rows[] = {
-        {"plain",                   "[Settings]\nWindow%20Pos=a b\n",                          "a b"       },
-        {"no file",                 "",                                                        nullptr     },
-        {"another section",         "[Other]\nWindow%20Pos=a\n",                               nullptr     },
-        {"key without a section",   "Settings\\Window%20Pos=a\n",                              nullptr     },
-        {"the section comes twice", "[Settings]\nx=1\n[A]\nx=2\n[Settings]\nWindow%20Pos=a\n", "a"         },
-        {"the last one counts",     "[Settings]\nWindow%20Pos=a\nWindow%20Pos=b\n",            "b"         },
-        {"CR LF and a mark",        "\xef\xbb\xbf[Settings]\r\nWindow%20Pos=a\r\n",            "a"         },
-        {"blanks around all",       " [ Settings ] \n  Window%20Pos  =  a  \n",                "a"         },
-        {"quotes",                  "[Settings]\nWindow%20Pos=\"a; b=c, d \"\n",               "a; b=c, d "},
-        {"escapes",                 "[Settings]\nWindow%20Pos=C:\\\\x\\ty\\x41;z\n",           "C:\\x\tyA" },
-        {"unquoted list",           "[Settings]\nWindow%20Pos=0, 1,-1 ,\n",                    "0,1,-1,"   },
-        {"comment",                 "[Settings]\n;Window%20Pos=a\nWindow%20Pos=b ; c\n",       "b"         },
-        {"over a line end",         "[Settings]\nWindow%20Pos=\"a\\\nb\"\n",                   "ab"        },
-        {"marks",                   "[Settings]\nWindow%20Pos=@@a\n",                          "@a"        },
-        {"bytes",                   "[Settings]\nWindow%20Pos=@ByteArray(a)\n",                "a"         },
-        {"a wide key",              "[Settings]\nWindow%U0020Pos=\xc3\xa4\n",                  "\xc3\xa4"  },
-        {"no value",                "[Settings]\nWindow%20Pos=\n",                             ""          },
-        {"cut short",               "[Settings]\nWindow%20Pos=\"a\\",                          "a"         },
+        {"plain", "[Settings]\nWindow%20Pos=a b\n", "a b"},
+        {"no file", "", nullptr},
+        {"another section", "[Other]\nWindow%20Pos=a\n", nullptr},
+        {"key without a section", "Settings\\Window%20Pos=a\n", nullptr},
+        {"the section comes twice", "[Settings]\nx=1\n[A]\nx=2\n[Settings]\nWindow%20Pos=a\n", "a"},
+        {"the last one counts", "[Settings]\nWindow%20Pos=a\nWindow%20Pos=b\n", "b"},
+        {"CR LF and a mark", "\xef\xbb\xbf[Settings]\r\nWindow%20Pos=a\r\n", "a"},
+        {"blanks around all", " [ Settings ] \n  Window%20Pos  =  a  \n", "a"},
+        {"quotes", "[Settings]\nWindow%20Pos=\"a; b=c, d \"\n", "a; b=c, d "},
+        {"escapes", "[Settings]\nWindow%20Pos=C:\\\\x\\ty\\x41;z\n", "C:\\x\tyA"},
+        {"unquoted list", "[Settings]\nWindow%20Pos=0, 1,-1 ,\n", "0,1,-1,"},
+        {"comment", "[Settings]\n;Window%20Pos=a\nWindow%20Pos=b ; c\n", "b"},
+        {"over a line end", "[Settings]\nWindow%20Pos=\"a\\\nb\"\n", "ab"},
+        {"marks", "[Settings]\nWindow%20Pos=@@a\n", "@a"},
+        {"bytes", "[Settings]\nWindow%20Pos=@ByteArray(a)\n", "a"},
+        {"a wide key", "[Settings]\nWindow%U0020Pos=\xc3\xa4\n", "\xc3\xa4"},
+        {"no value", "[Settings]\nWindow%20Pos=\n", ""},
+        {"cut short", "[Settings]\nWindow%20Pos=\"a\\", "a"},
     };
     for (const auto& row : rows)
     {
@@ -53,14 +53,14 @@ TEST(IniText, Values)
 TEST(IniText, SettingKeepsEveryOtherLine)
 {
     const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
-        {"an empty file", "",                                "v",       "[Settings]\nK=v\n"                   },
-        {"replaced",      "[Settings]\nJ=1\nK=old\nL=2\n",   "v",       "[Settings]\nJ=1\nK=v\nL=2\n"         },
-        {"appended",      "[Settings]\nJ=1 ; c\n\n[B]\nK=2", "v",       "[Settings]\nJ=1 ; c\nK=v\n\n[B]\nK=2"},
-        {"a new section", "[B]\nK=2",                        "v",       "[B]\nK=2\n\n[Settings]\nK=v\n"       },
-        {"quoted",        "",                                "0,1;=",   "[Settings]\nK=\"0,1;=\"\n"           },
-        {"open quotes",   "[B]\nK=\"2",                      "v",       "[B]\nK=\"2\"\n\n[Settings]\nK=v\n"   },
-        {"a backslash",   "[Settings]\n\\",                  "v",       "[Settings]\n\\\n\nK=v"               },
-        {"escaped",       "",                                "@C:\\\"", "[Settings]\nK=@@C:\\\\\\\"\n"        },
+        {"an empty file", "", "v", "[Settings]\nK=v\n"},
+        {"replaced", "[Settings]\nJ=1\nK=old\nL=2\n", "v", "[Settings]\nJ=1\nK=v\nL=2\n"},
+        {"appended", "[Settings]\nJ=1 ; c\n\n[B]\nK=2", "v", "[Settings]\nJ=1 ; c\nK=v\n\n[B]\nK=2"},
+        {"a new section", "[B]\nK=2", "v", "[B]\nK=2\n\n[Settings]\nK=v\n"},
+        {"quoted", "", "0,1;=", "[Settings]\nK=\"0,1;=\"\n"},
+        {"open quotes", "[B]\nK=\"2", "v", "[B]\nK=\"2\"\n\n[Settings]\nK=v\n"},
+        {"a backslash", "[Settings]\n\\", "v", "[Settings]\n\\\n\nK=v"},
+        {"escaped", "", "@C:\\\"", "[Settings]\nK=@@C:\\\\\\\"\n"},
     };
     for (const auto& [what, before, value, after] : rows)
     {
@@ -139,11 +139,11 @@ TEST_F(FilePlatform, Documents)
 {
     const std::string home = m_kFolder.Path("home");
     const std::tuple<const char*, std::string, std::string> rows[] = {
-        {"none named",      "XDG_MUSIC_DIR=\"$HOME/Music\"\n",       home + "/Documents"},
-        {"below the home",  "XDG_DOCUMENTS_DIR=\"$HOME/Papiere\"\n", home + "/Papiere"  },
-        {"somewhere else",  " XDG_DOCUMENTS_DIR=\"/srv/docs\"\n",    "/srv/docs"        },
-        {"a relative path", "XDG_DOCUMENTS_DIR=\"docs\"\n",          home + "/Documents"},
-        {"commented out",   "#XDG_DOCUMENTS_DIR=\"/srv\"\n",         home + "/Documents"},
+        {"none named", "XDG_MUSIC_DIR=\"$HOME/Music\"\n", home + "/Documents"},
+        {"below the home", "XDG_DOCUMENTS_DIR=\"$HOME/Papiere\"\n", home + "/Papiere"},
+        {"somewhere else", " XDG_DOCUMENTS_DIR=\"/srv/docs\"\n", "/srv/docs"},
+        {"a relative path", "XDG_DOCUMENTS_DIR=\"docs\"\n", home + "/Documents"},
+        {"commented out", "#XDG_DOCUMENTS_DIR=\"/srv\"\n", home + "/Documents"},
     };
     for (const auto& [what, line, folder] : rows)
     {
@@ -155,20 +155,9 @@ TEST_F(FilePlatform, Documents)
 TEST_F(FilePlatform, LanguageOfTheEnvironment)
 {
     const std::tuple<const char*, const char*> rows[] = {
-        {"de_AT.UTF-8", "deu"},
-        {"es",          "esn"},
-        {"fr_CA",       "fra"},
-        {"it_IT@euro",  "ita"},
-        {"ja_JP",       "jpn"},
-        {"ko_KR",       "kor"},
-        {"pt_BR",       "ptg"},
-        {"zh_CN",       "chs"},
-        {"zh_TW",       "cht"},
-        {"en_US",       "enu"},
-        {"nl_NL",       "enu"},
-        {"C",           "enu"},
-        {"deu",         "enu"},
-        {"",            "enu"},
+        {"de_AT.UTF-8", "deu"}, {"es", "esn"},    {"fr_CA", "fra"}, {"it_IT@euro", "ita"}, {"ja_JP", "jpn"},
+        {"ko_KR", "kor"},       {"pt_BR", "ptg"}, {"zh_CN", "chs"}, {"zh_TW", "cht"},      {"en_US", "enu"},
+        {"nl_NL", "enu"},       {"C", "enu"},     {"deu", "enu"},   {"", "enu"},
     };
     Set("LANG", "fr_FR");
     for (const auto& [name, code] : rows)
@@ -183,18 +172,12 @@ TEST(WindowPlacement, Texts)
     const WindowPlacement placement{0, 1, -1, -1, -1, -1, 100, -50, 740, 480};
     EXPECT_EQ(PlacementText(placement), "0,1,-1,-1,-1,-1,100,-50,740,480");
     const std::tuple<const char*, bool> rows[] = {
-        {"0,1,-1,-1,-1,-1,100,-50,740,480",   true },
-        {"0, 1, -1,-1,-1,-1,100,-50,740,480", true },
-        {"2,1,-1,-1,-1,-1,100,-50,740",       false},
-        {"0junk,1,-1,-1,-1,-1,0,0,740,480",   false},
-        {"0.5,1,-1,-1,-1,-1,0,0,740,480",     false},
-        {"0,1,-1,-1,-1,-1,0,0,740,480.5",     false},
-        {"0,1,-1,-1,-1,-1,0,0,740,480,9",     false},
-        {"9999999999,1,-1,-1,-1,-1,0,0,7,4",  false},
-        {"0,1,-1,-1,-1,-1,100,-50,740,",      false},
-        {"0,1,-1,,-1,-1,100,-50,740,480",     false},
-        {"0 1 -1 -1 -1 -1 100 -50 740 480",   false},
-        {"",                                  false},
+        {"0,1,-1,-1,-1,-1,100,-50,740,480", true},  {"0, 1, -1,-1,-1,-1,100,-50,740,480", true},
+        {"2,1,-1,-1,-1,-1,100,-50,740", false},     {"0junk,1,-1,-1,-1,-1,0,0,740,480", false},
+        {"0.5,1,-1,-1,-1,-1,0,0,740,480", false},   {"0,1,-1,-1,-1,-1,0,0,740,480.5", false},
+        {"0,1,-1,-1,-1,-1,0,0,740,480,9", false},   {"9999999999,1,-1,-1,-1,-1,0,0,7,4", false},
+        {"0,1,-1,-1,-1,-1,100,-50,740,", false},    {"0,1,-1,,-1,-1,100,-50,740,480", false},
+        {"0 1 -1 -1 -1 -1 100 -50 740 480", false}, {"", false},
     };
     for (const auto& [text, scans] : rows)
     {

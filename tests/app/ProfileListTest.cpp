@@ -32,10 +32,10 @@ TEST_F(ContentTest, PathsByDisplayName)
 {
     Write("docs/BVH Profile/Custom1.prf", "poser\n"); // hidden by the stock profile of that name
     const std::tuple<const char*, const char*, std::string> rows[] = {
-        {"a stock profile",        "Poser",  "data/PoserBVH.prf"           },
-        {"case does not matter",   "POSER",  "data/PoserBVH.prf"           },
-        {"a custom profile",       "mine",   "docs/BVH Profile/Custom0.prf"},
-        {"a name that nobody has", "Nobody", ""                            },
+        {"a stock profile", "Poser", "data/PoserBVH.prf"},
+        {"case does not matter", "POSER", "data/PoserBVH.prf"},
+        {"a custom profile", "mine", "docs/BVH Profile/Custom0.prf"},
+        {"a name that nobody has", "Nobody", ""},
     };
     for (const auto& [what, name, path] : rows)
     {
@@ -62,13 +62,13 @@ TEST_F(ContentTest, StockChoice)
         const char* before; // selected by hand before
         const char* after;
     } rows[] = {
-        {"the Poser profile fits",         BvhText(kPoserBones), "",      "Poser"  },
-        {"it wins over a choice by hand",  BvhText(kPoserBones), "Mine",  "Poser"  },
-        {"the MAX profile fits",           BvhText(kMaxBones),   "",      "3DS MAX"},
-        {"it replaces the Poser profile",  BvhText(kMaxBones),   "Poser", "3DS MAX"},
-        {"but not another choice by hand", BvhText(kMaxBones),   "Mine",  "Mine"   },
-        {"neither fits, the choice stays", none,                 "Mine",  "Mine"   },
-        {"neither fits, none is chosen",   none,                 "",      ""       },
+        {"the Poser profile fits", BvhText(kPoserBones), "", "Poser"},
+        {"it wins over a choice by hand", BvhText(kPoserBones), "Mine", "Poser"},
+        {"the MAX profile fits", BvhText(kMaxBones), "", "3DS MAX"},
+        {"it replaces the Poser profile", BvhText(kMaxBones), "Poser", "3DS MAX"},
+        {"but not another choice by hand", BvhText(kMaxBones), "Mine", "Mine"},
+        {"neither fits, the choice stays", none, "Mine", "Mine"},
+        {"neither fits, none is chosen", none, "", ""},
     };
     for (const auto& row : rows)
     {
@@ -153,12 +153,8 @@ TEST_F(ContentTest, AnUnsavedNameStandsInTheListAndCannotBeDeleted)
 TEST_F(ContentTest, ListsKeepASelectionWhenEntriesGo)
 {
     const std::tuple<const char*, int, int, int> rows[] = {
-        {"one before it",    2, 0,  1 },
-        {"one behind it",    0, 2,  0 },
-        {"itself",           1, 1,  1 },
-        {"itself, the last", 2, 2,  1 },
-        {"all",              1, -1, -1},
-        {"none there",       1, 7,  1 },
+        {"one before it", 2, 0, 1},    {"one behind it", 0, 2, 0}, {"itself", 1, 1, 1},
+        {"itself, the last", 2, 2, 1}, {"all", 1, -1, -1},         {"none there", 1, 7, 1},
     };
     for (const auto& [what, selected, deleted, after] : rows)
     {

@@ -51,10 +51,10 @@ TEST_F(ContentTest, FilesAfterASave)
         const char* name;
         std::vector<std::string> files; // in the folder afterwards
     } rows[] = {
-        {"a package leaves no HTR",          "a.Kinetra", {"a.Kinetra"}},
-        {"any other extension gives an HTR", "b.mot",     {"b.htr"}    },
-        {"an HTR",                           "c.htr",     {"c.htr"}    },
-        {"no extension",                     "d",         {"d.htr"}    },
+        {"a package leaves no HTR", "a.Kinetra", {"a.Kinetra"}},
+        {"any other extension gives an HTR", "b.mot", {"b.htr"}},
+        {"an HTR", "c.htr", {"c.htr"}},
+        {"no extension", "d", {"d.htr"}},
     };
     OpenAndConvert();
     for (const auto& row : rows)
@@ -91,9 +91,9 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
     chmod(path.c_str(), 0444);
     // next: step, which ends what the title says
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"a read-only package",        "old.Kinetra",      "click convert"},
+        {"a read-only package", "old.Kinetra", "click convert"},
         {"a folder that is not there", "none/out.Kinetra", "open gone.bvh"},
-        {"an HTR in such a folder",    "none/out.htr",     "open walk.bvh"},
+        {"an HTR in such a folder", "none/out.htr", "open walk.bvh"},
     };
     for (const auto& [what, name, next] : rows)
     {

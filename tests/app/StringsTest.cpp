@@ -23,13 +23,13 @@ constexpr uint32_t kFrench = 1036;
 std::string Library()
 {
     return ResourceFile({
-        {138,  kFrench, "Fichier invalide."             },
-        {138,  kGerman, "Ungültige Datei. \xe2\x82\xac"},
-        {139,  kGerman, "*"                             },
-        {144,  0,       "Neutral"                       },
-        {144,  kFrench, "Profil!"                       },
-        {171,  kGerman, "*no text in the table either"  },
-        {4711, kGerman, "new"                           },
+        {138, kFrench, "Fichier invalide."},
+        {138, kGerman, "Ungültige Datei. \xe2\x82\xac"},
+        {139, kGerman, "*"},
+        {144, 0, "Neutral"},
+        {144, kFrench, "Profil!"},
+        {171, kGerman, "*no text in the table either"},
+        {4711, kGerman, "new"},
     });
 }
 
@@ -50,12 +50,12 @@ TEST(StringLibrary, StringsByIdAndLanguage)
         uint32_t locale;
         const char* text; // empty when none is found
     } rows[] = {
-        {"the locale's own",             138,  kGerman,   "Ungültige Datei. \xe2\x82\xac"},
-        {"another of the same language", 138,  kAustrian, "Ungültige Datei. \xe2\x82\xac"},
-        {"neutral before a foreign one", 144,  kGerman,   "Neutral"                       },
-        {"foreign rather than none",     138,  2052,      "Ungültige Datei. \xe2\x82\xac"},
-        {"an empty place in a block",    140,  kGerman,   ""                              },
-        {"a block that is not there",    9999, kGerman,   ""                              },
+        {"the locale's own", 138, kGerman, "Ungültige Datei. \xe2\x82\xac"},
+        {"another of the same language", 138, kAustrian, "Ungültige Datei. \xe2\x82\xac"},
+        {"neutral before a foreign one", 144, kGerman, "Neutral"},
+        {"foreign rather than none", 138, 2052, "Ungültige Datei. \xe2\x82\xac"},
+        {"an empty place in a block", 140, kGerman, ""},
+        {"a block that is not there", 9999, kGerman, ""},
     };
     for (const auto& row : rows)
     {
@@ -108,13 +108,13 @@ TEST(ResourceManager, AStarLeavesATextToTheProgram)
         bool found;
         const char* text;
     } rows[] = {
-        {"translated",          translated, 138,  true,  "Ungültige Datei. \xe2\x82\xac"},
-        {"a star",              translated, 139,  true,  "Save convertion result?"       },
-        {"not in the library",  translated, 137,  true,  "Unable to locate Kestro."      },
-        {"only in the library", translated, 4711, true,  "new"                           },
-        {"nowhere",             translated, 1,    false, ""                              },
-        {"no library",          plain,      138,  true,  "Invalid BVH file format."      },
-        {"no such message",     plain,      -5,   false, ""                              },
+        {"translated", translated, 138, true, "Ungültige Datei. \xe2\x82\xac"},
+        {"a star", translated, 139, true, "Save convertion result?"},
+        {"not in the library", translated, 137, true, "Unable to locate Kestro."},
+        {"only in the library", translated, 4711, true, "new"},
+        {"nowhere", translated, 1, false, ""},
+        {"no library", plain, 138, true, "Invalid BVH file format."},
+        {"no such message", plain, -5, false, ""},
     };
     for (const auto& row : rows)
     {
@@ -129,9 +129,9 @@ TEST(StringTable, FormatsTakeNothingButTheirArguments)
     const std::string arguments[] = {"2", "walk"};
     const std::tuple<const char*, const char*> rows[] = {
         {"Batch Converting %d : %s", "Batch Converting 2 : walk"},
-        {"%s%s%s%s",                 "2walk"                    },
-        {"100% %n %5d",              "100% %n %5d"              },
-        {"%",                        "%"                        },
+        {"%s%s%s%s", "2walk"},
+        {"100% %n %5d", "100% %n %5d"},
+        {"%", "%"},
     };
     for (const auto& [format, text] : rows)
         EXPECT_EQ(FormatText(format, arguments), text);
@@ -155,17 +155,21 @@ TEST(FailureWords, AReportSaysWhereAndWhatToDo)
 {
     const std::tuple<const char*, const char*, CFailure, const char*> rows[] = {
         {"a line",
-         "a.bvh",   {EFailure::BlankLine, 12, "Frames:"},
+         "a.bvh",
+         {EFailure::BlankLine, 12, "Frames:"},
          "a.bvh:12: expected this keyword, but found an empty line: \"Frames:\" (remove the empty line)"},
         {"a byte of a container",
-         "a.orn",   {EFailure::UnknownClass, 381, "CSpoon"},
-         "a.orn: byte 381: the file contains an object of an unknown class: \"CSpoon\""                 },
+         "a.orn",
+         {EFailure::UnknownClass, 381, "CSpoon"},
+         "a.orn: byte 381: the file contains an object of an unknown class: \"CSpoon\""},
         {"a name that would command a terminal",
-         "\x1b[2J", {EFailure::TooDeep, 0, "\x1b[31m"},
-         "\\x1b[2J: bones or objects are nested too deeply: \"\\x1b[31m\""                              },
+         "\x1b[2J",
+         {EFailure::TooDeep, 0, "\x1b[31m"},
+         "\\x1b[2J: bones or objects are nested too deeply: \"\\x1b[31m\""},
         {"the path is not said twice",
-         "a.htr",   {EFailure::NotRegular, 0, "a.htr"},
-         "a.htr: this is a folder or a device, not a file"                                              },
+         "a.htr",
+         {EFailure::NotRegular, 0, "a.htr"},
+         "a.htr: this is a folder or a device, not a file"},
     };
     for (const auto& [what, path, failure, line] : rows)
         EXPECT_EQ(ReportLine(MakeReport(path, failure, false)), line) << what;

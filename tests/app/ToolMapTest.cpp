@@ -114,11 +114,11 @@ TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
         std::function<void(MapLine&)> edit;
         const char* text;
     } rows[] = {
-        {"a text, cut",      0, setText,    "\u00c4 name of more than thirty-two c"},
-        {"the position",     1, setNumbers, "Position 1,-2,720"                    },
-        {"the frame rate",   2, setRate,    "FrameRate 25"                         },
-        {"a new mapping",    3, setNumbers, "hip <---> LowerTorso 1,-2,720"        },
-        {"a turned mapping", 4, setNumbers, "lThigh <---> LThigh 1,-2,720"         },
+        {"a text, cut", 0, setText, "\u00c4 name of more than thirty-two c"},
+        {"the position", 1, setNumbers, "Position 1,-2,720"},
+        {"the frame rate", 2, setRate, "FrameRate 25"},
+        {"a new mapping", 3, setNumbers, "hip <---> LowerTorso 1,-2,720"},
+        {"a turned mapping", 4, setNumbers, "lThigh <---> LThigh 1,-2,720"},
     };
     LoadSource();
     LoadMap(kMap);
@@ -214,16 +214,16 @@ TEST_F(ToolTest, HostileMaps)
     for (int byte = 0; byte < 256; ++byte)
         everyByte += static_cast<char>(byte);
     const std::tuple<const char*, std::string> rows[] = {
-        {"nothing",                                      ""                                           },
-        {"empty lines",                                  std::string(1000,                              '\n')},
-        {"one long line",                                              std::string(200'000,                                                                             'x')},
-        {"a long mapping",                                          "hip <---> LowerTorso " + std::string(200'000,           '9')},
-        {"long names",std::string(70'000,'a') + " <---> " + std::string(70'000, 'b')},
-        {"every byte",                                   everyByte + everyByte                                                                                                      },
-        {"zeros",                                          std::string(5000,                                                                                       '\0')},
-        {"no numbers","Position a,b,c\nFrameRate\nhip <---> LowerTorso x,y,z\n"},
-        {"numbers too large","Position 1e99,-1e99,nan\nFrameRate 99999999999\nhip <---> LowerTorso 1e39\n"},
-        {"keywords alone",                                   "Position\n<--->\n*\nFrameRate\n"                                },
+        {"nothing", ""},
+        {"empty lines", std::string(1000, '\n')},
+        {"one long line", std::string(200'000, 'x')},
+        {"a long mapping", "hip <---> LowerTorso " + std::string(200'000, '9')},
+        {"long names", std::string(70'000, 'a') + " <---> " + std::string(70'000, 'b')},
+        {"every byte", everyByte + everyByte},
+        {"zeros", std::string(5000, '\0')},
+        {"no numbers", "Position a,b,c\nFrameRate\nhip <---> LowerTorso x,y,z\n"},
+        {"numbers too large", "Position 1e99,-1e99,nan\nFrameRate 99999999999\nhip <---> LowerTorso 1e39\n"},
+        {"keywords alone", "Position\n<--->\n*\nFrameRate\n"},
     };
     LoadSource();
     for (const auto& [what, bytes] : rows)

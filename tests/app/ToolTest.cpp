@@ -185,9 +185,9 @@ TEST_F(ToolTest, TheResultIsSavedAtItsFixedScale)
     EXPECT_NE(Read("out.htr").find("NumFrames 2\n"), std::string::npos) << "one frame of sixty";
 
     const std::tuple<const char*, const char*, const char*> refused[] = {
-        {"data/base.htr", "out.bvh",      "Not saved: out.bvh: results are written as .htr only"},
-        {"data/base.htr", "none/out.htr", "Not saved: out.htr: the file cannot be written"      },
-        {"walk.bvh",      "new.htr",      "Not saved: new.htr: the target has no rest pose"     },
+        {"data/base.htr", "out.bvh", "Not saved: out.bvh: results are written as .htr only"},
+        {"data/base.htr", "none/out.htr", "Not saved: out.htr: the file cannot be written"},
+        {"walk.bvh", "new.htr", "Not saved: new.htr: the target has no rest pose"},
     };
     for (const auto& [target, path, says] : refused)
     {

@@ -21,17 +21,17 @@ TEST_F(ContentTest, ControlsFollowTheState)
     const std::string open = "convert end fend play %adv |playbar";
     const std::string converted = open + " apply";
     const std::tuple<const char*, const char*, std::string> rows[] = {
-        {"nothing is open",       "",                        ""                                     },
-        {"no stock profile fits", "open other.bvh",          "play end fend |playbar"               },
-        {"a source without keys", "open still.bvh",          "%adv"                                 },
-        {"a stock profile fits",  "open walk.bvh",           open                                   },
-        {"the source plays",      "click play",              open + " stop"                         },
-        {"at its end",            "click play, click end",   "play back fback convert %adv |playbar"},
-        {"back at its start",     "click back",              open                                   },
-        {"converted",             "click convert",           converted + " play1 end1 NextFrm1"     },
-        {"the result plays",      "click play1",             converted + " stop1 end1 NextFrm1"     },
-        {"at its end",            "click stop1, click END1", converted + " play1 start1 PreFrm1"    },
-        {"a custom profile",      "select Mine",             converted + " play1 start1 PreFrm1 del"},
+        {"nothing is open", "", ""},
+        {"no stock profile fits", "open other.bvh", "play end fend |playbar"},
+        {"a source without keys", "open still.bvh", "%adv"},
+        {"a stock profile fits", "open walk.bvh", open},
+        {"the source plays", "click play", open + " stop"},
+        {"at its end", "click play, click end", "play back fback convert %adv |playbar"},
+        {"back at its start", "click back", open},
+        {"converted", "click convert", converted + " play1 end1 NextFrm1"},
+        {"the result plays", "click play1", converted + " stop1 end1 NextFrm1"},
+        {"at its end", "click stop1, click END1", converted + " play1 start1 PreFrm1"},
+        {"a custom profile", "select Mine", converted + " play1 start1 PreFrm1 del"},
     };
     for (const auto& [what, steps, enabled] : rows)
     {
@@ -56,10 +56,10 @@ TEST_F(ContentTest, DiscardQuestion)
 {
     // saves: whether the save dialog is answered with a path
     const std::tuple<const char*, EAnswer, bool, bool, bool> rows[] = {
-        {"cancel keeps the result",      EAnswer::Cancel, false, false, false},
-        {"no drops it",                  EAnswer::No,     false, true,  false},
-        {"yes saves it",                 EAnswer::Yes,    true,  true,  true },
-        {"yes and then cancel loses it", EAnswer::Yes,    false, true,  false},
+        {"cancel keeps the result", EAnswer::Cancel, false, false, false},
+        {"no drops it", EAnswer::No, false, true, false},
+        {"yes saves it", EAnswer::Yes, true, true, true},
+        {"yes and then cancel loses it", EAnswer::Yes, false, true, false},
     };
     OpenAndConvert();
     for (const auto& [what, answer, saves, opened, saved] : rows)
@@ -108,11 +108,11 @@ TEST_F(ContentTest, AFailedOpenKeepsTheSource)
     const size_t frames = text.find("Frames:");
     Write("blank.bvh", text.substr(0, frames) + '\n' + text.substr(frames));
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"no such file",                 "none.bvh",  "not-found, 138"                 },
-        {"no motion in it",              "words.bvh", "missing-section HIERARCHY, 138" },
-        {"an empty line in a bad place", "blank.bvh", "blank-line Frames:, 138"        },
-        {"a container without track",    "still.orn", "no-track, 138"                  },
-        {"a container cut short",        "cut.orn",   "truncated CKeyframeControl, 138"},
+        {"no such file", "none.bvh", "not-found, 138"},
+        {"no motion in it", "words.bvh", "missing-section HIERARCHY, 138"},
+        {"an empty line in a bad place", "blank.bvh", "blank-line Frames:, 138"},
+        {"a container without track", "still.orn", "no-track, 138"},
+        {"a container cut short", "cut.orn", "truncated CKeyframeControl, 138"},
     };
     Open(Write("walk.bvh", BvhText(kPoserBones)));
     const CNode* root = m_kContent.SourceRoot();
@@ -164,10 +164,10 @@ TEST_F(ContentTest, AProfileThatDoesNotFitStopsTheConversion)
         std::string rows;
         const char* words;
     } rows[] = {
-        {"no row for the root bone", legs,                             "no-root-row, 144"   },
-        {"a fixed row for it",       legs + "* LowerTorso . .1,2,3\n", "no-root-source, 144"},
-        {"a bone the source lacks",  hip + "hop <---> LThigh 0\n",     "misfit, 144"        },
-        {"a bone the target lacks",  hip + "hip <---> Tail 0\n",       "misfit, 144"        },
+        {"no row for the root bone", legs, "no-root-row, 144"},
+        {"a fixed row for it", legs + "* LowerTorso . .1,2,3\n", "no-root-source, 144"},
+        {"a bone the source lacks", hip + "hop <---> LThigh 0\n", "misfit, 144"},
+        {"a bone the target lacks", hip + "hip <---> Tail 0\n", "misfit, 144"},
     };
     OpenAndConvert();
     for (const auto& row : rows)
@@ -272,10 +272,7 @@ TEST_F(ContentTest, ClosingAsksTheEditorFirst)
     SelectProfile("Mine");
     m_kContent.ProfileEditor()->MarkChanged();
     m_kWindow.TakeCalls();
-    m_kWindow.m_kAnswers = {
-        {161, EAnswer::No    },
-        {139, EAnswer::Cancel}
-    };
+    m_kWindow.m_kAnswers = {{161, EAnswer::No}, {139, EAnswer::Cancel}};
     EXPECT_FALSE(m_kContent.MayClose());
     EXPECT_EQ(m_kWindow.TakeCalls(), (std::vector<std::string>{"box 161", "box 139"}));
 }

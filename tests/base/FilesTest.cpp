@@ -75,13 +75,13 @@ private:
 TEST(Paths, SplitIntoFolderStemAndExtension)
 {
     const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
-        {"/a.b/walk.cut.bvh", "/a.b/",    "walk.cut", ".bvh"},
-        {"C:\\in\\walk.BVH",  "C:\\in\\", "walk",     ".BVH"},
-        {"a/b\\walk",         "a/b\\",    "walk",     ""    },
-        {"walk.",             "",         "walk",     "."   },
-        {".bvh",              "",         "",         ".bvh"},
-        {"a.b/",              "a.b/",     "",         ""    },
-        {"",                  "",         "",         ""    },
+        {"/a.b/walk.cut.bvh", "/a.b/", "walk.cut", ".bvh"},
+        {"C:\\in\\walk.BVH", "C:\\in\\", "walk", ".BVH"},
+        {"a/b\\walk", "a/b\\", "walk", ""},
+        {"walk.", "", "walk", "."},
+        {".bvh", "", "", ".bvh"},
+        {"a.b/", "a.b/", "", ""},
+        {"", "", "", ""},
     };
     for (const auto& [path, folder, stem, extension] : rows)
     {
@@ -103,13 +103,13 @@ TEST(Paths, WhatIsThereIsToldApart)
     WriteBytes(file, "12345");
     const std::string endless(300, 'x');
     const std::tuple<const char*, std::string, bool, bool, bool> rows[] = {
-        {"file",          file,                true,  false, true },
-        {"folder",        folder.Path(),       false, true,  false},
-        {"device",        "/dev/null",         true,  false, false},
-        {"nothing",       folder.Path("none"), false, false, false},
-        {"inside a file", file + "/x",         false, false, false},
-        {"name too long", endless,             false, false, false},
-        {"no name",       "",                  false, false, false},
+        {"file", file, true, false, true},
+        {"folder", folder.Path(), false, true, false},
+        {"device", "/dev/null", true, false, false},
+        {"nothing", folder.Path("none"), false, false, false},
+        {"inside a file", file + "/x", false, false, false},
+        {"name too long", endless, false, false, false},
+        {"no name", "", false, false, false},
     };
     for (const auto& [what, path, isFile, isFolder, hasSize] : rows)
     {
@@ -165,12 +165,12 @@ TEST(CMappedFile, MapsRegularFilesOnly)
     WriteBytes(folder.Path("empty"), "");
     ASSERT_EQ(mkfifo(folder.Path("pipe").c_str(), 0600), 0);
     const std::tuple<const char*, std::string, EFailure, const char*> rows[] = {
-        {"file",             folder.Path("full"),  EFailure::None,       "HIERARCHY"},
-        {"empty file",       folder.Path("empty"), EFailure::None,       ""         },
-        {"nothing there",    folder.Path("none"),  EFailure::NotFound,   ""         },
-        {"folder",           folder.Path(),        EFailure::NotRegular, ""         },
-        {"device",           "/dev/zero",          EFailure::NotRegular, ""         },
-        {"pipe, not waited", folder.Path("pipe"),  EFailure::NotRegular, ""         },
+        {"file", folder.Path("full"), EFailure::None, "HIERARCHY"},
+        {"empty file", folder.Path("empty"), EFailure::None, ""},
+        {"nothing there", folder.Path("none"), EFailure::NotFound, ""},
+        {"folder", folder.Path(), EFailure::NotRegular, ""},
+        {"device", "/dev/zero", EFailure::NotRegular, ""},
+        {"pipe, not waited", folder.Path("pipe"), EFailure::NotRegular, ""},
     };
     for (const auto& [what, path, failure, text] : rows)
     {
@@ -344,14 +344,14 @@ TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
     fs::create_directory(folder.Path("folder"));
     const size_t before = EntryCount(folder);
     const std::tuple<const char*, std::string> rows[] = {
-        {"read-only file",        folder.Path("readonly")},
-        {"link to it",            folder.Path("link")    },
-        {"folder",                folder.Path("folder")  },
-        {"folder with separator", folder.Path("folder/") },
-        {"device",                "/dev/null"            },
-        {"no such folder",        folder.Path("none/a")  },
-        {"links in a ring",       folder.Path("ring")    },
-        {"no name",               ""                     },
+        {"read-only file", folder.Path("readonly")},
+        {"link to it", folder.Path("link")},
+        {"folder", folder.Path("folder")},
+        {"folder with separator", folder.Path("folder/")},
+        {"device", "/dev/null"},
+        {"no such folder", folder.Path("none/a")},
+        {"links in a ring", folder.Path("ring")},
+        {"no name", ""},
     };
     for (const auto& [what, path] : rows)
     {

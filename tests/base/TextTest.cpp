@@ -32,12 +32,12 @@ std::string Lines(std::string_view text)
 TEST(Text, TokensAreCutAtRunsOfDelimiters)
 {
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"nothing",                   "",                     ""                    },
-        {"delimiters only",           " ,\t\n",               ""                    },
-        {"a comma is a blank",        "1,2 3",                "1|2|3|"              },
-        {"runs, and at both ends",    ",\n a \t, bc ,",       "a|bc|"               },
-        {"a carriage return is none", "a\rb c\r",             "a\rb|c\r|"           },
-        {"bytes above 127 are none",  "H\xc3\xbc \xff ,\x80", "H\xc3\xbc|\xff|\x80|"},
+        {"nothing", "", ""},
+        {"delimiters only", " ,\t\n", ""},
+        {"a comma is a blank", "1,2 3", "1|2|3|"},
+        {"runs, and at both ends", ",\n a \t, bc ,", "a|bc|"},
+        {"a carriage return is none", "a\rb c\r", "a\rb|c\r|"},
+        {"bytes above 127 are none", "H\xc3\xbc \xff ,\x80", "H\xc3\xbc|\xff|\x80|"},
     };
     for (const auto& [what, text, tokens] : rows)
         EXPECT_EQ(Tokens(text), tokens) << what;
@@ -52,10 +52,10 @@ TEST(Text, TokensAreCutAtRunsOfDelimiters)
 TEST(Text, LinesEndAtLineFeedsWithOrWithoutCarriageReturn)
 {
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"nothing",                  "",              ""           },
-        {"LF and CR LF",             "a\nb\r\nc\n",   "a|b|c|"     },
-        {"empty lines",              "\n\r\n\n",      "|||"        },
-        {"no end at the last line",  "a\nb",          "a|b|"       },
+        {"nothing", "", ""},
+        {"LF and CR LF", "a\nb\r\nc\n", "a|b|c|"},
+        {"empty lines", "\n\r\n\n", "|||"},
+        {"no end at the last line", "a\nb", "a|b|"},
         {"a lone CR is a character", "a\rb\r\r\nc\r", "a\rb\r|c\r|"},
     };
     for (const auto& [what, text, lines] : rows)
@@ -83,19 +83,19 @@ TEST(Text, BlanksAndMarksGoFromTheEndsOnly)
 TEST(Text, PrintableTextCommandsNoTerminal)
 {
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"plain",                    "Hips 1",           "Hips 1"              },
-        {"letters beyond ASCII",     "Hüfte 腰 🦴",  "Hüfte 腰 🦴"     },
-        {"escape sequence",          "\x1b[2J\x07\x7f",  "\\x1b[2J\\x07\\x7f"  },
-        {"line feed",                "a\n",              "a\\x0a"              },
-        {"control of two bytes",     "\xc2\x9b[2J",      "\\xc2\\x9b[2J"       },
-        {"no-break space is none",   "a\xc2\xa0 b",      "a\xc2\xa0 b"         },
-        {"stray byte",               "a\x9b[2J",         "a\\x9b[2J"           },
-        {"cut sequence",             "\xe8\x85",         "\\xe8\\x85"          },
-        {"sequence without its end", "\xe8\x1b[",        "\\xe8\\x1b["         },
-        {"overlong control",         "\xc0\x9b",         "\\xc0\\x9b"          },
-        {"overlong in three bytes",  "\xe0\x80\x9b",     "\\xe0\\x80\\x9b"     },
-        {"half of a surrogate pair", "\xed\xa0\x80",     "\\xed\\xa0\\x80"     },
-        {"no code point",            "\xf4\x90\x80\x80", "\\xf4\\x90\\x80\\x80"},
+        {"plain", "Hips 1", "Hips 1"},
+        {"letters beyond ASCII", "Hüfte 腰 🦴", "Hüfte 腰 🦴"},
+        {"escape sequence", "\x1b[2J\x07\x7f", "\\x1b[2J\\x07\\x7f"},
+        {"line feed", "a\n", "a\\x0a"},
+        {"control of two bytes", "\xc2\x9b[2J", "\\xc2\\x9b[2J"},
+        {"no-break space is none", "a\xc2\xa0 b", "a\xc2\xa0 b"},
+        {"stray byte", "a\x9b[2J", "a\\x9b[2J"},
+        {"cut sequence", "\xe8\x85", "\\xe8\\x85"},
+        {"sequence without its end", "\xe8\x1b[", "\\xe8\\x1b["},
+        {"overlong control", "\xc0\x9b", "\\xc0\\x9b"},
+        {"overlong in three bytes", "\xe0\x80\x9b", "\\xe0\\x80\\x9b"},
+        {"half of a surrogate pair", "\xed\xa0\x80", "\\xed\\xa0\\x80"},
+        {"no code point", "\xf4\x90\x80\x80", "\\xf4\\x90\\x80\\x80"},
     };
     for (const auto& [what, text, printed] : rows)
         EXPECT_EQ(Printable(text), printed) << what;
@@ -105,13 +105,13 @@ TEST(Text, NearestNameIsASlipAwayOrNone)
 {
     const std::vector<std::string> bones = {"Hips", "Spine", "LeftUpLeg", "RightUpLeg", "LeftLeg"};
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"case has no say",         "leftupleg", "LeftUpLeg"},
-        {"a letter too many",       "Hipss",     "Hips"     },
-        {"a letter changed",        "Spime",     "Spine"    },
-        {"the nearer of two",       "LftLeg",    "LeftLeg"  },
-        {"another word",            "Head",      ""         },
-        {"nothing",                 "",          ""         },
-        {"short and all different", "x",         ""         },
+        {"case has no say", "leftupleg", "LeftUpLeg"},
+        {"a letter too many", "Hipss", "Hips"},
+        {"a letter changed", "Spime", "Spine"},
+        {"the nearer of two", "LftLeg", "LeftLeg"},
+        {"another word", "Head", ""},
+        {"nothing", "", ""},
+        {"short and all different", "x", ""},
     };
     for (const auto& [what, name, nearest] : rows)
         EXPECT_EQ(NearestName(name, bones), nearest) << what;

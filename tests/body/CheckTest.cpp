@@ -61,15 +61,15 @@ TEST(CheckBody, DoubtsMapsThatAreWrong)
         EBodyDoubt doubt;
         EBodyJoint joint;
     } rows[] = {
-        {"left and right swapped",       SwapAll,                                                       EBodyDoubt::SidesSwapped,  EBodyJoint::Thigh   },
-        {"arms swapped",                 [](CBodyMap& body) { std::swap(body.arms[0], body.arms[1]); },
-         EBodyDoubt::SidesSwapped,                                                                                                 EBodyJoint::UpperArm},
-        {"clavicles as upper arms",      MoveArmsInward,                                                EBodyDoubt::ArmIsClavicle, EBodyJoint::UpperArm},
-        {"upper arms as clavicles",      MoveArmsOutward,                                               EBodyDoubt::ClavicleIsArm, EBodyJoint::UpperArm},
-        {"shins as thighs",              MoveLegsOutward,                                               EBodyDoubt::OddLength,     EBodyJoint::Thigh   },
+        {"left and right swapped", SwapAll, EBodyDoubt::SidesSwapped, EBodyJoint::Thigh},
+        {"arms swapped", [](CBodyMap& body) { std::swap(body.arms[0], body.arms[1]); },
+         EBodyDoubt::SidesSwapped, EBodyJoint::UpperArm},
+        {"clavicles as upper arms", MoveArmsInward, EBodyDoubt::ArmIsClavicle, EBodyJoint::UpperArm},
+        {"upper arms as clavicles", MoveArmsOutward, EBodyDoubt::ClavicleIsArm, EBodyJoint::UpperArm},
+        {"shins as thighs", MoveLegsOutward, EBodyDoubt::OddLength, EBodyJoint::Thigh},
         {"a hand that is the other one", [](CBodyMap& body) { body.arms[0].hand = body.arms[1].hand; },
-         EBodyDoubt::NotBelow,                                                                                                     EBodyJoint::Hand    },
-        {"arms as legs",                 TakeArmsForLegs,                                               EBodyDoubt::NotBelow,      EBodyJoint::Spine   },
+         EBodyDoubt::NotBelow, EBodyJoint::Hand},
+        {"arms as legs", TakeArmsForLegs, EBodyDoubt::NotBelow, EBodyJoint::Spine},
     };
     for (const char* recipe : {"fingers", "fingers apose zup", "fingers nopose walk rightfirst"})
     {
@@ -204,12 +204,9 @@ TEST(FindBody, FindsNoneWhereNoneIs)
         int fan;   // joints beside each other at its end
         float bone;
     } rows[] = {
-        {"one joint",          1,      0,      1.0f },
-        {"a long chain",       20'000, 0,      1.0f },
-        {"a fan",              1,      20'000, 1.0f },
-        {"a chain with a fan", 100,    100,    1.0f },
-        {"no lengths",         10,     10,     0.0f },
-        {"endless lengths",    10,     10,     3e38f},
+        {"one joint", 1, 0, 1.0f},    {"a long chain", 20'000, 0, 1.0f},
+        {"a fan", 1, 20'000, 1.0f},   {"a chain with a fan", 100, 100, 1.0f},
+        {"no lengths", 10, 10, 0.0f}, {"endless lengths", 10, 10, 3e38f},
     };
     for (const auto& row : rows)
     {

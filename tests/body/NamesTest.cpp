@@ -25,11 +25,11 @@ constexpr const char* kPlaces =
     "LeftUpLeg LeftLeg LeftFoot LeftToeBase RightUpLeg RightLeg RightFoot RightToeBase ";
 // What else may hang on joints.
 constexpr std::pair<const char*, const char*> kExtras[] = {
-    {"LeftHand",     "LeftHand_End LeftInHandIndex LeftHandThumb1 LeftHandMiddle1 Props_LeftArm"     },
-    {"RightHand",    "RightHand_End RightInHandIndex RightHandThumb1 RightHandMiddle1 Props_RightArm"},
-    {"LeftArm",      "LeftArmRoll Left_upperarm_twist_01 LeftShldrTwist LeftArmNub"                  },
-    {"RightToeBase", "RightToe_End RightBigToe toe1-1.R RightToeTip"                                 },
-    {"Head",         "HeadTop_End leftEye Jaw HeadNub"                                               },
+    {"LeftHand", "LeftHand_End LeftInHandIndex LeftHandThumb1 LeftHandMiddle1 Props_LeftArm"},
+    {"RightHand", "RightHand_End RightInHandIndex RightHandThumb1 RightHandMiddle1 Props_RightArm"},
+    {"LeftArm", "LeftArmRoll Left_upperarm_twist_01 LeftShldrTwist LeftArmNub"},
+    {"RightToeBase", "RightToe_End RightBigToe toe1-1.R RightToeTip"},
+    {"Head", "HeadTop_End leftEye Jaw HeadNub"},
 };
 
 std::string NameOf(const CNode* node)
@@ -88,16 +88,16 @@ TEST(FindBodyByNames, ABodyKeepsItsJointsWhateverIsDoneToItsNames)
         ELetters letters;
         bool extras;
     } rows[] = {
-        {"as it is",                               "",              AsTheyAre, false},
-        {"a namespace",                            "Skeleton 002:", AsTheyAre, false},
-        {"a prefix with an underscore",            "Model_",        AsTheyAre, false},
-        {"a prefix with a dash",                   "DEF-",          AsTheyAre, false},
-        {"a prefix and nothing behind it",         "mixamorig",     AsTheyAre, false},
-        {"two prefixes",                           "J_Bip_",        AsTheyAre, false},
-        {"capital letters",                        "",              Upper,     false},
-        {"small letters",                          "",              Lower,     false},
-        {"fingers, twists and ends",               "",              AsTheyAre, true },
-        {"fingers, twists and ends with a prefix", "avg_",          AsTheyAre, true },
+        {"as it is", "", AsTheyAre, false},
+        {"a namespace", "Skeleton 002:", AsTheyAre, false},
+        {"a prefix with an underscore", "Model_", AsTheyAre, false},
+        {"a prefix with a dash", "DEF-", AsTheyAre, false},
+        {"a prefix and nothing behind it", "mixamorig", AsTheyAre, false},
+        {"two prefixes", "J_Bip_", AsTheyAre, false},
+        {"capital letters", "", Upper, false},
+        {"small letters", "", Lower, false},
+        {"fingers, twists and ends", "", AsTheyAre, true},
+        {"fingers, twists and ends with a prefix", "avg_", AsTheyAre, true},
     };
     for (const auto& row : rows)
     {
@@ -131,25 +131,25 @@ TEST(FindBodyByNames, ABodyKeepsItsJointsWhateverIsDoneToItsNames)
 TEST(FindBodyByNames, WordsAreUnderstoodInTheirCompany)
 {
     const std::tuple<const char*, const char*, EBodyJoint, const char*> rows[] = {
-        {"a shoulder beside an arm is a clavicle",               "Hips(LeftShoulder(LeftArm(LeftForeArm)))",
-         EBodyJoint::Clavicle,                                                                                                               "LeftShoulder"},
-        {"a shoulder without one is the upper arm",              "Hips(LeftCollar(LeftShoulder(LeftElbow)))",
-         EBodyJoint::UpperArm,                                                                                                               "LeftShoulder"},
+        {"a shoulder beside an arm is a clavicle", "Hips(LeftShoulder(LeftArm(LeftForeArm)))",
+         EBodyJoint::Clavicle, "LeftShoulder"},
+        {"a shoulder without one is the upper arm", "Hips(LeftCollar(LeftShoulder(LeftElbow)))",
+         EBodyJoint::UpperArm, "LeftShoulder"},
         {"a shoulder between clavicle and upper arm is neither",
-         "Hips(clavicle.L(shoulder01.L(upperarm01.L(upperarm02.L))))",                                                 EBodyJoint::UpperArm, "upperarm01.L"},
-        {"a leg below an up leg is the shin",                    "Hips(LeftUpLeg(LeftLeg))",                           EBodyJoint::Shin,     "LeftLeg"     },
-        {"a leg above a knee is the thigh",                      "Hips(LeftLeg(LeftKnee))",                            EBodyJoint::Thigh,    "LeftLeg"     },
-        {"a hip of a side is the thigh",                         "Hips(LHipJoint(LeftHip(LeftKnee)))",                 EBodyJoint::Thigh,    "LeftHip"     },
-        {"a hip of a side above an up leg is no thigh",          "Hips(LeftHip(LeftUpLeg))",                           EBodyJoint::Thigh,
-         "LeftUpLeg"                                                                                                                                       },
-        {"a foot below an ankle is the toe",                     "Hips(AnkleLeft(FootLeft))",                          EBodyJoint::Toe,      "FootLeft"    },
-        {"a helper with the same words",                         "Hips(__UpLeg_L(UpLeg_L(LoLeg_L)))",                  EBodyJoint::Thigh,    "UpLeg_L"     },
-        {"a hand below a wrist",                                 "Hips(LeftWrist(lhand(LThumb)))",                     EBodyJoint::Hand,     "LeftWrist"   },
-        {"one toe of five is none",                              "Hips(foot.L(toe1-1.L toe2-1.L))",                    EBodyJoint::Toe,      "(none)"      },
-        {"a hip that does not carry the trunk",                  "Root(Hips(LeftThigh RightThigh) Spine(Neck(Head)))",
-         EBodyJoint::Hip,                                                                                                                    "Root"        },
-        {"words of one letter more are others",                  "Hips(Handle(Headband) Legend Armature)",             EBodyJoint::Head,
-         "(none)"                                                                                                                                          },
+         "Hips(clavicle.L(shoulder01.L(upperarm01.L(upperarm02.L))))", EBodyJoint::UpperArm, "upperarm01.L"},
+        {"a leg below an up leg is the shin", "Hips(LeftUpLeg(LeftLeg))", EBodyJoint::Shin, "LeftLeg"},
+        {"a leg above a knee is the thigh", "Hips(LeftLeg(LeftKnee))", EBodyJoint::Thigh, "LeftLeg"},
+        {"a hip of a side is the thigh", "Hips(LHipJoint(LeftHip(LeftKnee)))", EBodyJoint::Thigh, "LeftHip"},
+        {"a hip of a side above an up leg is no thigh", "Hips(LeftHip(LeftUpLeg))", EBodyJoint::Thigh,
+         "LeftUpLeg"},
+        {"a foot below an ankle is the toe", "Hips(AnkleLeft(FootLeft))", EBodyJoint::Toe, "FootLeft"},
+        {"a helper with the same words", "Hips(__UpLeg_L(UpLeg_L(LoLeg_L)))", EBodyJoint::Thigh, "UpLeg_L"},
+        {"a hand below a wrist", "Hips(LeftWrist(lhand(LThumb)))", EBodyJoint::Hand, "LeftWrist"},
+        {"one toe of five is none", "Hips(foot.L(toe1-1.L toe2-1.L))", EBodyJoint::Toe, "(none)"},
+        {"a hip that does not carry the trunk", "Root(Hips(LeftThigh RightThigh) Spine(Neck(Head)))",
+         EBodyJoint::Hip, "Root"},
+        {"words of one letter more are others", "Hips(Handle(Headband) Legend Armature)", EBodyJoint::Head,
+         "(none)"},
     };
     for (const auto& [what, tree, joint, name] : rows)
     {

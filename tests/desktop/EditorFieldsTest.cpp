@@ -218,11 +218,11 @@ TEST_F(EditorPlace, APlaceOfAnotherSizeOrOffTheScreensIsNotUsed)
         int left, top, width, height;
         bool used;
     } rows[] = {
-        {"elsewhere on the screen", 200,    100,     0, 0,  true },
-        {"wider",                   200,    100,     1, 0,  false},
-        {"lower",                   200,    100,     0, -1, false},
-        {"far away",                90'000, 100,     0, 0,  false},
-        {"above all screens",       200,    -90'000, 0, 0,  false},
+        {"elsewhere on the screen", 200, 100, 0, 0, true},
+        {"wider", 200, 100, 1, 0, false},
+        {"lower", 200, 100, 0, -1, false},
+        {"far away", 90'000, 100, 0, 0, false},
+        {"above all screens", 200, -90'000, 0, 0, false},
     };
     for (const auto& row : rows)
     {

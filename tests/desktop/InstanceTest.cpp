@@ -117,15 +117,15 @@ TEST_F(Instances, WhatIsNoRequestIsPassedOver)
     const QByteArray zeroInPath = MakeMessage(std::string("/takes\0/", 8));
     const QByteArray noUtf8 = MakeMessage("/takes/\xff\xfe");
     const std::tuple<const char*, QByteArray> rows[] = {
-        {"nothing",                ""                  },
-        {"another protocol",       "GET / HTTP/1.1\r\n"},
-        {"zeros",                  zeros               },
-        {"the beginning of one",   beginning           },
-        {"something behind one",   more                },
-        {"a length beyond paths",  endless             },
-        {"a path with a zero",     zeroInPath          },
-        {"a path of no UTF-8",     noUtf8              },
-        {"more than anybody says", flood               },
+        {"nothing", ""},
+        {"another protocol", "GET / HTTP/1.1\r\n"},
+        {"zeros", zeros},
+        {"the beginning of one", beginning},
+        {"something behind one", more},
+        {"a length beyond paths", endless},
+        {"a path with a zero", zeroInPath},
+        {"a path of no UTF-8", noUtf8},
+        {"more than anybody says", flood},
     };
     const CInstanceServer server(Remember());
     for (const auto& [what, bytes] : rows)
@@ -177,12 +177,9 @@ TEST_F(Instances, TheyMeetWhereNobodyElseCanWrite)
     const std::string far = folder(std::string(100, 'x'), 0x7700);
     const std::string none = m_kFolder.Path("none");
     const std::tuple<const char*, std::string, std::string> rows[] = {
-        {"the runtime folder",     runtime, runtime},
-        {"one that all can write", open,    own    },
-        {"one that is too long",   far,     own    },
-        {"one that there is not",  none,    own    },
-        {"a relative one",         "run",   own    },
-        {"none",                   "",      own    },
+        {"the runtime folder", runtime, runtime}, {"one that all can write", open, own},
+        {"one that is too long", far, own},       {"one that there is not", none, own},
+        {"a relative one", "run", own},           {"none", "", own},
     };
     for (const auto& [what, runtimeFolder, meeting] : rows)
     {

@@ -196,9 +196,9 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     auto* const editor = person.Frame().findChild<QWidget*>(QStringLiteral("profileEditor"));
     Activate(*editor);
     const std::tuple<const char*, QWidget*> rows[] = {
-        {"over the main window",                    &person.Frame()},
-        {"over the editor, which the click leaves", editor         },
-        {"while another program had the keyboard",  nullptr        },
+        {"over the main window", &person.Frame()},
+        {"over the editor, which the click leaves", editor},
+        {"while another program had the keyboard", nullptr},
     };
     for (const auto& [what, pressedOver] : rows)
     {

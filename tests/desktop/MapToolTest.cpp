@@ -167,9 +167,9 @@ TEST_F(MapToolTest, EachKindOfLineHasItsDialog)
         const char* dialog;
         const char* text;
     } rows[] = {
-        {0, "161", "Walking"                    },
-        {1, "159", "Position 0,-70,0"           },
-        {2, "160", "FrameRate -70"              },
+        {0, "161", "Walking"},
+        {1, "159", "Position 0,-70,0"},
+        {2, "160", "FrameRate -70"},
         {4, "158", "lThigh <---> LThigh 1,-70,3"},
     };
     LoadSourceAndMap();

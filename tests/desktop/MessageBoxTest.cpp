@@ -45,14 +45,14 @@ Act Key(Qt::Key key)
 TEST(MessageBox, EveryButtonAnswersForItself)
 {
     const std::tuple<EButtons, const char*, EAnswer> rows[] = {
-        {EButtons::OK,          "ok",     EAnswer::OK    },
-        {EButtons::OKCancel,    "ok",     EAnswer::OK    },
-        {EButtons::OKCancel,    "cancel", EAnswer::Cancel},
-        {EButtons::YesNoCancel, "yes",    EAnswer::Yes   },
-        {EButtons::YesNoCancel, "no",     EAnswer::No    },
+        {EButtons::OK, "ok", EAnswer::OK},
+        {EButtons::OKCancel, "ok", EAnswer::OK},
+        {EButtons::OKCancel, "cancel", EAnswer::Cancel},
+        {EButtons::YesNoCancel, "yes", EAnswer::Yes},
+        {EButtons::YesNoCancel, "no", EAnswer::No},
         {EButtons::YesNoCancel, "cancel", EAnswer::Cancel},
-        {EButtons::YesNo,       "yes",    EAnswer::Yes   },
-        {EButtons::YesNo,       "no",     EAnswer::No    },
+        {EButtons::YesNo, "yes", EAnswer::Yes},
+        {EButtons::YesNo, "no", EAnswer::No},
     };
     for (const auto& [buttons, name, answer] : rows)
         EXPECT_EQ(Ask(buttons, Press(name)), answer) << name;
@@ -61,10 +61,10 @@ TEST(MessageBox, EveryButtonAnswersForItself)
 TEST(MessageBox, EnterAnswersFirstAndWhatClosesAnswersMostCarefully)
 {
     const std::tuple<EButtons, EAnswer, EAnswer> rows[] = {
-        {EButtons::OK,          EAnswer::OK,  EAnswer::OK    },
-        {EButtons::OKCancel,    EAnswer::OK,  EAnswer::Cancel},
+        {EButtons::OK, EAnswer::OK, EAnswer::OK},
+        {EButtons::OKCancel, EAnswer::OK, EAnswer::Cancel},
         {EButtons::YesNoCancel, EAnswer::Yes, EAnswer::Cancel},
-        {EButtons::YesNo,       EAnswer::Yes, EAnswer::No    },
+        {EButtons::YesNo, EAnswer::Yes, EAnswer::No},
     };
     for (const auto& [buttons, enter, escape] : rows)
     {

@@ -143,10 +143,10 @@ TEST_F(SelectFolder, GoesIntoFoldersAndUpAgain)
 TEST_F(SelectFolder, TakesAPathThatIsWritten)
 {
     const std::tuple<const char*, std::string, std::string> rows[] = {
-        {"a path",           m_kFolder.Path("day 1"),  "day 1/"},
+        {"a path", m_kFolder.Path("day 1"), "day 1/"},
         {"with a separator", m_kFolder.Path("day 1/"), "day 1/"},
-        {"a name",           "day 2\\",                "day 2/"},
-        {"nothing",          "",                       ""      },
+        {"a name", "day 2\\", "day 2/"},
+        {"nothing", "", ""},
     };
     for (const auto& [what, text, folder] : rows)
     {

@@ -15,13 +15,13 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
     withoutBar.erase(withoutBar.find("bar "),
                      withoutBar.find('\n', withoutBar.find("bar ")) - withoutBar.find("bar "));
     const std::tuple<const char*, std::string, const char*> rows[] = {
-        {"bvh.cnt", "",                                 "has no size"          },
-        {"bvh.cnt", withoutBar,                         "no child \"|playbar\""},
-        {"bvh.cnt", layout + "button x 1 2 three 4\n",  "invalid line"         },
-        {"bvh.cnt", layout + "button x 1 2 0 4\n",      "invalid line"         },
-        {"bvh.cnt", layout + "knob x 1 2 3 4\n",        "invalid line"         },
-        {"bvh.cnt", layout + "button x 1 2 3 4 none\n", "icons/none.svg"       },
-        {"bvh.cnt", "size 1 99999\n" + layout,          "invalid line"         },
+        {"bvh.cnt", "", "has no size"},
+        {"bvh.cnt", withoutBar, "no child \"|playbar\""},
+        {"bvh.cnt", layout + "button x 1 2 three 4\n", "invalid line"},
+        {"bvh.cnt", layout + "button x 1 2 0 4\n", "invalid line"},
+        {"bvh.cnt", layout + "knob x 1 2 3 4\n", "invalid line"},
+        {"bvh.cnt", layout + "button x 1 2 3 4 none\n", "icons/none.svg"},
+        {"bvh.cnt", "size 1 99999\n" + layout, "invalid line"},
     };
     for (const auto& [file, text, words] : rows)
     {

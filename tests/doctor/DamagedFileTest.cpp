@@ -76,11 +76,11 @@ TEST(DamagedFiles, WithBytesChangedAreAnswered)
 TEST(DamagedFiles, ThatHoldNoMotionAreTold)
 {
     const std::tuple<const char*, std::string, const char*> rows[] = {
-        {"nothing",      "",                    "0 reader"                            },
-        {"another text", "solid cube\nfacet\n", "2 reader"                            },
-        {"bytes",        std::string(300,       '\x01'),                                "0 not-text"},
-        {"a motion without hierarchy",              "MOTION\nFrames: 1\n0 0 0\n",        "1 reader"    },
-        {"a hierarchy without joints",              "HIERARCHY\nMOTION\nFrames: 1\n",        "2 reader"},
+        {"nothing", "", "0 reader"},
+        {"another text", "solid cube\nfacet\n", "2 reader"},
+        {"bytes", std::string(300, '\x01'), "0 not-text"},
+        {"a motion without hierarchy", "MOTION\nFrames: 1\n0 0 0\n", "1 reader"},
+        {"a hierarchy without joints", "HIERARCHY\nMOTION\nFrames: 1\n", "2 reader"},
     };
     for (const auto& [what, text, found] : rows)
     {
@@ -102,15 +102,15 @@ TEST(RealFiles, HaveTheFaultsThatTheyHave)
         const char* name;
         const char* faults;
     } rows[] = {
-        {"bandai_walk_normal_002.bvh", "12 doubled-offset"                                                   },
-        {"cmu_cgspeed_example.bvh",    "411 spike"                                                           }, // the right thumb is turned by 177 degrees for two frames
-        {"geno_stance.bvh",            "4 doubled-hip-offset, 8 doubled-offset"                              },
-        {"neuron_milad.bvh",           "4 doubled-hip-offset, 8 doubled-offset, 350 empty-line-before-frames"},
-        {"poser_boxing.bvh",           "4 doubled-hip-offset, 8 doubled-offset"                              },
-        {"poser_pose1.bvh",            "128 surplus-rows"                                                    },
-        {"pymo_walk_120hz.bvh",        "4 doubled-hip-offset"                                                },
-        {"rokoko_jesse_dance.bvh",     "4 doubled-hip-offset"                                                },
-        {"walk01_leftupleg.bvh",       "4 doubled-hip-offset"                                                },
+        {"bandai_walk_normal_002.bvh", "12 doubled-offset"},
+        {"cmu_cgspeed_example.bvh", "411 spike"}, // the right thumb is turned by 177 degrees for two frames
+        {"geno_stance.bvh", "4 doubled-hip-offset, 8 doubled-offset"},
+        {"neuron_milad.bvh", "4 doubled-hip-offset, 8 doubled-offset, 350 empty-line-before-frames"},
+        {"poser_boxing.bvh", "4 doubled-hip-offset, 8 doubled-offset"},
+        {"poser_pose1.bvh", "128 surplus-rows"},
+        {"pymo_walk_120hz.bvh", "4 doubled-hip-offset"},
+        {"rokoko_jesse_dance.bvh", "4 doubled-hip-offset"},
+        {"walk01_leftupleg.bvh", "4 doubled-hip-offset"},
     };
     if (SharedDataFolder().empty())
         GTEST_SKIP() << "no shared data here";

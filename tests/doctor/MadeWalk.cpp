@@ -27,27 +27,17 @@ struct JointRow
 };
 
 constexpr JointRow kJoints[] = {
-    {"Hips",          0, {0.0f, 0.0f, 0.0f},   0.0,    0.0},
-    {"LeftUpLeg",     1, {9.0f, -2.0f, 0.0f},  kSwing, 0.0},
-    {"LeftLeg",       2, {0.0f, -41.0f, 0.0f}, 0.0,    0.0},
-    {"LeftFoot",      3, {0.0f, -41.0f, 0.0f}, 0.0,    0.0},
-    {"LeftToeBase",   4, {0.0f, -5.0f, 14.0f}, 0.0,    0.0},
-    {"RightUpLeg",    1, {-9.0f, -2.0f, 0.0f}, kSwing, 0.5},
-    {"RightLeg",      2, {0.0f, -41.0f, 0.0f}, 0.0,    0.0},
-    {"RightFoot",     3, {0.0f, -41.0f, 0.0f}, 0.0,    0.0},
-    {"RightToeBase",  4, {0.0f, -5.0f, 14.0f}, 0.0,    0.0},
-    {"Spine",         1, {0.0f, 10.0f, 0.0f},  2.0,    0.0},
-    {"Spine1",        2, {0.0f, 20.0f, 0.0f},  2.0,    0.3},
-    {"LeftShoulder",  3, {4.0f, 18.0f, 0.0f},  1.0,    0.1},
-    {"LeftArm",       4, {13.0f, 0.0f, 0.0f},  9.0,    0.5},
-    {"LeftForeArm",   5, {27.0f, 0.0f, 0.0f},  3.0,    0.6},
-    {"LeftHand",      6, {25.0f, 0.0f, 0.0f},  2.0,    0.7},
-    {"RightShoulder", 3, {-4.0f, 18.0f, 0.0f}, 1.0,    0.6},
-    {"RightArm",      4, {-13.0f, 0.0f, 0.0f}, 9.0,    0.0},
-    {"RightForeArm",  5, {-27.0f, 0.0f, 0.0f}, 3.0,    0.1},
-    {"RightHand",     6, {-25.0f, 0.0f, 0.0f}, 2.0,    0.2},
-    {"Neck",          3, {0.0f, 22.0f, 0.0f},  1.0,    0.4},
-    {"Head",          4, {0.0f, 10.0f, 1.0f},  1.0,    0.8},
+    {"Hips", 0, {0.0f, 0.0f, 0.0f}, 0.0, 0.0},           {"LeftUpLeg", 1, {9.0f, -2.0f, 0.0f}, kSwing, 0.0},
+    {"LeftLeg", 2, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},      {"LeftFoot", 3, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},
+    {"LeftToeBase", 4, {0.0f, -5.0f, 14.0f}, 0.0, 0.0},  {"RightUpLeg", 1, {-9.0f, -2.0f, 0.0f}, kSwing, 0.5},
+    {"RightLeg", 2, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},     {"RightFoot", 3, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},
+    {"RightToeBase", 4, {0.0f, -5.0f, 14.0f}, 0.0, 0.0}, {"Spine", 1, {0.0f, 10.0f, 0.0f}, 2.0, 0.0},
+    {"Spine1", 2, {0.0f, 20.0f, 0.0f}, 2.0, 0.3},        {"LeftShoulder", 3, {4.0f, 18.0f, 0.0f}, 1.0, 0.1},
+    {"LeftArm", 4, {13.0f, 0.0f, 0.0f}, 9.0, 0.5},       {"LeftForeArm", 5, {27.0f, 0.0f, 0.0f}, 3.0, 0.6},
+    {"LeftHand", 6, {25.0f, 0.0f, 0.0f}, 2.0, 0.7},      {"RightShoulder", 3, {-4.0f, 18.0f, 0.0f}, 1.0, 0.6},
+    {"RightArm", 4, {-13.0f, 0.0f, 0.0f}, 9.0, 0.0},     {"RightForeArm", 5, {-27.0f, 0.0f, 0.0f}, 3.0, 0.1},
+    {"RightHand", 6, {-25.0f, 0.0f, 0.0f}, 2.0, 0.2},    {"Neck", 3, {0.0f, 22.0f, 0.0f}, 1.0, 0.4},
+    {"Head", 4, {0.0f, 10.0f, 1.0f}, 1.0, 0.8},
 };
 
 // A leg swings evenly, so that the foot on the ground stands while the hip goes on.
@@ -117,9 +107,7 @@ std::string MadeWalk(const WalkStyle& style)
         const bool isHip = row.name == std::string_view("Hips");
         const Vec3 position = isHip ? HipAt(seconds) : style.repeatsOffsets ? row.offset : kVec3Zero;
         const double turn = row.turn * Wave(seconds / kStrideSeconds + row.onset);
-        return TextKey{
-            written(position), {static_cast<float>(turn), 0.0f, 0.0f}
-        };
+        return TextKey{written(position), {static_cast<float>(turn), 0.0f, 0.0f}};
     };
     CMadeText text(std::move(joints));
     text.m_bScientific = style.scientific;

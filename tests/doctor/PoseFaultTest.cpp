@@ -47,15 +47,15 @@ TEST(PoseFaults, AreFound)
     fast.declaredRate = 120.0;
     const std::string walk = MadeWalk();
     const std::tuple<const char*, std::string, const char*> rows[] = {
-        {"a joint that turns away for a frame", WithValues(walk, 40,                                 kHandY, {"75"}), "170 spike"},
-        {"one that does for two",                              WithValues(walk,                                  40,                                                                    kHandY, {"75", "74"}), "170 spike"},
-        {"a hip that jumps aside for a frame",WithValues(walk,40,kHipX, {"30"}), "170 spike"},
-        {"positions that repeat the offsets",                          MadeWalk(doubled),                                         "8 doubled-offset"                                       },
-        {"a height that stands twice",                                   MadeWalk(floating),                                                                         "4 doubled-hip-offset"                                                                                                                                                                      },
-        {"a root that does not move",                                     MadeWalk(below),                  "2 still-root"         },
-        {"left for right",                                     SidesSwapped(walk),                         "30 sides-swapped"},
-        {"120 frames a second said to be 24",                                     MadeWalk(slow),                          "129 wrong-rate"},
-        {"30 frames a second said to be 120",                                     MadeWalk(fast),                                     "129 wrong-rate"       },
+        {"a joint that turns away for a frame", WithValues(walk, 40, kHandY, {"75"}), "170 spike"},
+        {"one that does for two", WithValues(walk, 40, kHandY, {"75", "74"}), "170 spike"},
+        {"a hip that jumps aside for a frame", WithValues(walk, 40, kHipX, {"30"}), "170 spike"},
+        {"positions that repeat the offsets", MadeWalk(doubled), "8 doubled-offset"},
+        {"a height that stands twice", MadeWalk(floating), "4 doubled-hip-offset"},
+        {"a root that does not move", MadeWalk(below), "2 still-root"},
+        {"left for right", SidesSwapped(walk), "30 sides-swapped"},
+        {"120 frames a second said to be 24", MadeWalk(slow), "129 wrong-rate"},
+        {"30 frames a second said to be 120", MadeWalk(fast), "129 wrong-rate"},
     };
     for (const auto& [what, text, found] : rows)
     {
@@ -71,10 +71,10 @@ TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
     other.frames = 150;
     const std::string walk = MadeWalk();
     const std::tuple<const char*, std::string> rows[] = {
-        {"a quick turn that stays",           WithValues(walk,                             87, kHandY, {"75", "75", "75"})},
-        {"a strike: out and back on the way",                             WithValues(walk,                                                     40, kHandY, {"30", "65", "75", "60", "25"})},
+        {"a quick turn that stays", WithValues(walk, 87, kHandY, {"75", "75", "75"})},
+        {"a strike: out and back on the way", WithValues(walk, 40, kHandY, {"30", "65", "75", "60", "25"})},
         {"a turn given as one more whole turn", WithValues(walk, 40, kHandY, {"360"})},
-        {"an odd rate that is right",                             MadeWalk(other)                                        },
+        {"an odd rate that is right", MadeWalk(other)},
     };
     for (const auto& [what, text] : rows)
     {
@@ -134,22 +134,22 @@ TEST(Healthy, FilesOfEveryStyleHaveNoFault)
     };
     const std::string walk = MadeWalk();
     const std::tuple<const char*, std::string> rows[] = {
-        {"as it is",                   walk                                                                         },
-        {"CR LF",                      AllReplaced(walk,                                                              "\n", "\r\n")},
-        {"tabs between the values",                     AllReplaced(walk,                                                                                                  " 0.000000", "\t0.000000")},
-        {"a blank behind each row",AllReplaced(walk,"\n", " \n")},
-        {"no line end at the end",                            walk.substr(0,                                                                                 walk.size() - 1)},
-        {"empty lines at the end",                        walk + "\n\n"                                                                                                                                      },
-        {"words before the hierarchy",     "Root of all motions\n" + walk                                         },
-        {"names of other languages",                            Replaced(walk,                                                                                  "LeftToeBase", "\xc3\x9f\xe8\xb6\xb3")},
-        {"scientific numbers",                            styled([](WalkStyle& s) { s.scientific = true; })},
-        {"six channels on each joint",                            styled([](WalkStyle& s) { s.sixChannels = true; })                                      },
-        {"Z up",               styled([](WalkStyle& s) { s.zUp = true; })},
-        {"metres",         styled([](WalkStyle& s) { s.unit = 0.01f; })         },
+        {"as it is", walk},
+        {"CR LF", AllReplaced(walk, "\n", "\r\n")},
+        {"tabs between the values", AllReplaced(walk, " 0.000000", "\t0.000000")},
+        {"a blank behind each row", AllReplaced(walk, "\n", " \n")},
+        {"no line end at the end", walk.substr(0, walk.size() - 1)},
+        {"empty lines at the end", walk + "\n\n"},
+        {"words before the hierarchy", "Root of all motions\n" + walk},
+        {"names of other languages", Replaced(walk, "LeftToeBase", "\xc3\x9f\xe8\xb6\xb3")},
+        {"scientific numbers", styled([](WalkStyle& s) { s.scientific = true; })},
+        {"six channels on each joint", styled([](WalkStyle& s) { s.sixChannels = true; })},
+        {"Z up", styled([](WalkStyle& s) { s.zUp = true; })},
+        {"metres", styled([](WalkStyle& s) { s.unit = 0.01f; })},
         {"inches", styled([](WalkStyle& s) { s.unit = 1.0f / 2.54f; })},
-        {"no toes",                       styled([](WalkStyle& s) { s.toes = false; })                                           },
-        {"one frame",                     styled([](WalkStyle& s) { s.frames = 1; })                                             },
-        {"100 frames a second",                     styled([](WalkStyle& s) { s.rate = s.declaredRate = 100; })                                              },
+        {"no toes", styled([](WalkStyle& s) { s.toes = false; })},
+        {"one frame", styled([](WalkStyle& s) { s.frames = 1; })},
+        {"100 frames a second", styled([](WalkStyle& s) { s.rate = s.declaredRate = 100; })},
     };
     for (const auto& [what, text] : rows)
     {

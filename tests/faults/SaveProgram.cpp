@@ -65,7 +65,7 @@ constexpr struct
 } kSaves[] = {
     {"profile", SaveProfile},
     {"setting", SaveSetting},
-    {"map",     SaveMap    },
+    {"map", SaveMap},
 };
 
 bool Save(std::string_view kind, const std::string& path)

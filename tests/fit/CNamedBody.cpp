@@ -28,10 +28,7 @@ CNamedBody::CNamedBody(const Convention& convention, const BodyChange& change)
     AddTrunk();
     const CTempFolder folder;
     const auto key = [](size_t joint, int) {
-        return TextKey{
-            {0.0f, joint == 0 ? 95.0f : 0.0f, 0.0f},
-            kVec3Zero
-        };
+        return TextKey{{0.0f, joint == 0 ? 95.0f : 0.0f, 0.0f}, kVec3Zero};
     };
     WriteBytes(folder.Path("body.bvh"), CMadeText(m_kJoints).Write(2, 1.0 / 30.0, key));
     EXPECT_TRUE(m_kMotion.Load(folder.Path("body.bvh"))) << convention.what << ", " << change.what;
@@ -60,10 +57,7 @@ int CNamedBody::Add(int parent, const std::string& name, std::string_view target
 {
     // A shin's end is the ankle, and the foot goes on in front of it; everything else goes on as it came.
     const Vec3 tip = y < -30.0f ? Vec3{0.0f, -7.0f, 13.0f} : Vec3{x / 2.0f, y, z};
-    m_kJoints.push_back({
-        name, parent, {x, y, z},
-          tip
-    });
+    m_kJoints.push_back({name, parent, {x, y, z}, tip});
     m_kTargets[name] = targets;
     return static_cast<int>(m_kJoints.size()) - 1;
 }

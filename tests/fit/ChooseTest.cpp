@@ -69,10 +69,10 @@ TEST_F(Choose, OfEqualRowsTheRestPoseDecides)
         BodyChange change;
         const char* name;
     } rows[] = {
-        {"a hand of one bone", {"plain"},                    "MotionBuilder / HumanIK (2 spine joints)"},
+        {"a hand of one bone", {"plain"}, "MotionBuilder / HumanIK (2 spine joints)"},
         {"a hand of fingers",
          {"fingers", "", BodyChange::AsTheyAre, true, true},
-         "MotionBuilder / HumanIK (2 spine joints, fingers)"                                           },
+         "MotionBuilder / HumanIK (2 spine joints, fingers)"},
     };
     for (const auto& row : rows)
     {
@@ -170,12 +170,12 @@ TEST(SharedPrefix, NearlyAllNamesMustHaveIt)
         const char* others;
         std::vector<std::string> prefixes;
     } rows[] = {
-        {"none",                       "",          "",                   {}            },
-        {"an underscore",              "Model_",    "",                   {"Model_"}    },
-        {"a namespace in a namespace", "a:b:",      "",                   {"a:b:", "a:"}},
-        {"no separator",               "mixamorig", "",                   {"mixamorig"} },
-        {"a root outside",             "Model_",    "Armature",           {"Model_"}    },
-        {"many outside",               "Model_",    "Sword Shield Horse", {}            },
+        {"none", "", "", {}},
+        {"an underscore", "Model_", "", {"Model_"}},
+        {"a namespace in a namespace", "a:b:", "", {"a:b:", "a:"}},
+        {"no separator", "mixamorig", "", {"mixamorig"}},
+        {"a root outside", "Model_", "Armature", {"Model_"}},
+        {"many outside", "Model_", "Sword Shield Horse", {}},
     };
     for (const auto& row : rows)
     {
@@ -201,23 +201,23 @@ TEST_F(Choose, RealMotions)
         GTEST_SKIP() << "no shared data here";
     // name: empty where nothing fits
     const std::tuple<const char*, const char*, ESureness> rows[] = {
-        {"bandai_walk_normal_002", "Bandai Namco (2 spine joints)",                              ESureness::Sure  },
-        {"cmu_cgspeed_example",    "CMU, MotionBuilder names (3 spine joints, fingers)",         ESureness::Sure  },
-        {"daz3d_genesis",          "DAZ Genesis 3 and 8 (4 spine joints, fingers)",              ESureness::Sure  },
-        {"fair1_dab",              "MotionBuilder / HumanIK (4 spine joints, leaning, fingers)", ESureness::Likely},
-        {"fingers60_crlf",         "MotionBuilder / HumanIK (4 spine joints, curved, fingers)",  ESureness::Likely},
-        {"geno_stance",            "MotionBuilder / HumanIK (4 spine joints, leaning)",          ESureness::Likely},
-        {"julia_example",          "",                                                           ESureness::Sure  },
-        {"m21_female_walk",        "MotionBuilder / HumanIK, 21 joints (2 spine joints)",        ESureness::Likely},
-        {"makehuman_tpose",        "",                                                           ESureness::Sure  },
-        {"makehuman_walk1",        "",                                                           ESureness::Sure  },
-        {"mixamo_freebvh",         "Mixamo (3 spine joints, fingers)",                           ESureness::Sure  },
-        {"pymo_walk_120hz",        "MotionBuilder / HumanIK without neck (1 spine joint)",       ESureness::Likely},
-        {"rokoko_jesse_dance",     "Rokoko Studio, HumanIK (3 spine joints)",                    ESureness::Likely},
-        {"rotation_first_root",    "",                                                           ESureness::Sure  },
-        {"two_joints",             "",                                                           ESureness::Sure  },
-        {"walk01_leftupleg",       "MotionBuilder / HumanIK (2 spine joints, leaning)",          ESureness::Sure  },
-        {"xzy_leftupleg",          "MotionBuilder / HumanIK (4 spine joints)",                   ESureness::Likely},
+        {"bandai_walk_normal_002", "Bandai Namco (2 spine joints)", ESureness::Sure},
+        {"cmu_cgspeed_example", "CMU, MotionBuilder names (3 spine joints, fingers)", ESureness::Sure},
+        {"daz3d_genesis", "DAZ Genesis 3 and 8 (4 spine joints, fingers)", ESureness::Sure},
+        {"fair1_dab", "MotionBuilder / HumanIK (4 spine joints, leaning, fingers)", ESureness::Likely},
+        {"fingers60_crlf", "MotionBuilder / HumanIK (4 spine joints, curved, fingers)", ESureness::Likely},
+        {"geno_stance", "MotionBuilder / HumanIK (4 spine joints, leaning)", ESureness::Likely},
+        {"julia_example", "", ESureness::Sure},
+        {"m21_female_walk", "MotionBuilder / HumanIK, 21 joints (2 spine joints)", ESureness::Likely},
+        {"makehuman_tpose", "", ESureness::Sure},
+        {"makehuman_walk1", "", ESureness::Sure},
+        {"mixamo_freebvh", "Mixamo (3 spine joints, fingers)", ESureness::Sure},
+        {"pymo_walk_120hz", "MotionBuilder / HumanIK without neck (1 spine joint)", ESureness::Likely},
+        {"rokoko_jesse_dance", "Rokoko Studio, HumanIK (3 spine joints)", ESureness::Likely},
+        {"rotation_first_root", "", ESureness::Sure},
+        {"two_joints", "", ESureness::Sure},
+        {"walk01_leftupleg", "MotionBuilder / HumanIK (2 spine joints, leaning)", ESureness::Sure},
+        {"xzy_leftupleg", "MotionBuilder / HumanIK (4 spine joints)", ESureness::Likely},
     };
     for (const auto& [file, name, sureness] : rows)
     {
@@ -237,12 +237,9 @@ TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
     if (folder.empty())
         GTEST_SKIP() << "no shared data here";
     const std::tuple<const char*, const char*> rows[] = {
-        {"cmu1_jumping_jacks",    "MaxBVH.prf"  },
-        {"mocapbank_lefthip",     "MaxBVH.prf"  },
-        {"yxz_lefthip",           "MaxBVH.prf"  },
-        {"poser_boxing",          "PoserBVH.prf"},
-        {"poser_pose1",           "PoserBVH.prf"},
-        {"poser_tpose_one_frame", "PoserBVH.prf"},
+        {"cmu1_jumping_jacks", "MaxBVH.prf"}, {"mocapbank_lefthip", "MaxBVH.prf"},
+        {"yxz_lefthip", "MaxBVH.prf"},        {"poser_boxing", "PoserBVH.prf"},
+        {"poser_pose1", "PoserBVH.prf"},      {"poser_tpose_one_frame", "PoserBVH.prf"},
     };
     for (const auto& [file, profile] : rows)
     {

@@ -138,15 +138,15 @@ TEST(SuggestProfile, RowsGoWithWhatTheSkeletonHas)
         const char* target;
         ESuggestedRow kind;
     } rows[] = {
-        {"spine1",      "Waist",   ESuggestedRow::NoSource},
-        {"spine2",      "Waist",   ESuggestedRow::Turned  },
-        {"neck0",       "Neck",    ESuggestedRow::NoSource},
-        {"noclavicle",  "LCollar", ESuggestedRow::NoSource},
-        {"",            "LPelvis", ESuggestedRow::Fixed   },
-        {"",            "LThigh",  ESuggestedRow::Neutral },
-        {"",            "RCalf",   ESuggestedRow::Neutral },
-        {"",            "LFoot",   ESuggestedRow::Turned  },
-        {"nofeet walk", "LFoot",   ESuggestedRow::NoSource},
+        {"spine1", "Waist", ESuggestedRow::NoSource},
+        {"spine2", "Waist", ESuggestedRow::Turned},
+        {"neck0", "Neck", ESuggestedRow::NoSource},
+        {"noclavicle", "LCollar", ESuggestedRow::NoSource},
+        {"", "LPelvis", ESuggestedRow::Fixed},
+        {"", "LThigh", ESuggestedRow::Neutral},
+        {"", "RCalf", ESuggestedRow::Neutral},
+        {"", "LFoot", ESuggestedRow::Turned},
+        {"nofeet walk", "LFoot", ESuggestedRow::NoSource},
     };
     const auto target = LoadTarget();
     for (const auto& row : rows)

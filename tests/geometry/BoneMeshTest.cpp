@@ -110,10 +110,10 @@ TEST(AttachBoneMeshes, ABoneReachesToItsChildAndALeafIsAStump)
         float length;
         Vec3 along;
     } rows[] = {
-        {"along z, whatever the sign of x",          hip.Get(), 5.0f, kVec3UnitZ},
-        {"along x",                                  knee,      5.0f, kVec3UnitX},
-        {"a child without offset leaves the length", ankle,     1.5f, kVec3UnitX},
-        {"without offset of its own it stays empty", still,     0.0f, kVec3UnitY},
+        {"along z, whatever the sign of x", hip.Get(), 5.0f, kVec3UnitZ},
+        {"along x", knee, 5.0f, kVec3UnitX},
+        {"a child without offset leaves the length", ankle, 1.5f, kVec3UnitX},
+        {"without offset of its own it stays empty", still, 0.0f, kVec3UnitY},
     };
     for (const auto& row : rows)
     {

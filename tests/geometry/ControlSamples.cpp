@@ -46,10 +46,7 @@ void AddSeam(CTriMesh& first, CTriMesh& second)
     const Ref<CConnectData> seam = new CConnectData;
     seam->m_kFirst.m_pkMesh.Set(&first);
     seam->m_kFirst.m_kPoints = {1, 3};
-    seam->m_kFirst.m_kGroups = {
-        {0,         1},
-        {         }
-    };
+    seam->m_kFirst.m_kGroups = {{0, 1}, {}};
     seam->m_kSecond.m_pkMesh.Set(&second);
     seam->m_kSecond.m_kPoints = {0, 2};
     seam->m_kSecond.m_kGroups = {{5}};

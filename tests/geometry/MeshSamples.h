@@ -26,14 +26,8 @@ inline Ref<CTriMesh> Cube(int32_t colorCount = 0)
     mesh->SetTriangleQuantity(12);
     for (uint32_t i = 0; i < 8; ++i)
         mesh->XYZBuffer()[i] = {float(i & 1), float(i >> 1 & 1), float(i >> 2)};
-    constexpr uint32_t kQuads[6][4] = {
-        {0, 2, 3, 1},
-        {4, 5, 7, 6},
-        {0, 1, 5, 4},
-        {2, 6, 7, 3},
-        {0, 4, 6, 2},
-        {1, 3, 7, 5}
-    };
+    constexpr uint32_t kQuads[6][4] = {{0, 2, 3, 1}, {4, 5, 7, 6}, {0, 1, 5, 4},
+                                       {2, 6, 7, 3}, {0, 4, 6, 2}, {1, 3, 7, 5}};
     constexpr uint32_t kCorners[6] = {0, 1, 2, 0, 2, 3};
     for (uint32_t corner = 0; corner < 36; ++corner)
     {
@@ -56,10 +50,7 @@ inline Ref<CTriMesh> FullMesh()
     mesh->TriangleMtlID()[11] = 1;
     mesh->NormalBuffer()[7] = {0, 0, 1};
     mesh->ColorBuffer()[1] = {1, 0.5f, 0};
-    mesh->m_kAttributeRanges = {
-        AttributeRange{1,  0, 4},
-        AttributeRange{-2, 4, 8}
-    };
+    mesh->m_kAttributeRanges = {AttributeRange{1, 0, 4}, AttributeRange{-2, 4, 8}};
     mesh->m_apkUVWMap.resize(3);
     for (const size_t slot : {0, 2})
     {

@@ -34,11 +34,8 @@ TEST(Morph, MovesTheModelByTheWeightOfTheTime)
     mesh->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitZ, 1.57079632f), {0, 0, 5});
     CMorphControl& morph = AttachMorph(*mesh, {kVec3UnitX}); // fewer deltas than points
     const std::tuple<const char*, float, float> rows[] = {
-        {"before the first key", -1, 0   },
-        {"between",              1,  0.5f},
-        {"on a key",             4,  2   },
-        {"back",                 6,  1   },
-        {"behind the last",      9,  0   },
+        {"before the first key", -1, 0}, {"between", 1, 0.5f}, {"on a key", 4, 2}, {"back", 6, 1},
+        {"behind the last", 9, 0},
     };
     for (const auto& [what, time, weight] : rows)
     {
@@ -100,9 +97,7 @@ TEST(TextureFrames, ShowTheFrameOfTheKeyBeforeWithoutBlending)
     CTriMeshUVWMapControl* frames = new CTriMeshUVWMapControl;
     map->AttachControl(frames);
     frames->m_fEndTime = 10.0f;
-    frames->m_kFrames = {
-        kVec3UnitX, kVec3UnitY, kVec3UnitZ, kVec3One, {5, 5, 5}
-    }; // two and a half
+    frames->m_kFrames = {kVec3UnitX, kVec3UnitY, kVec3UnitZ, kVec3One, {5, 5, 5}}; // two and a half
     const auto first = [&](float time) {
         mesh->UpdateScene(time, false);
         return map->UVWBuffer()[0];

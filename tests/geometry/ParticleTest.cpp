@@ -40,14 +40,9 @@ TEST(Particles, SlowRatesDoNotStarveAndTimeThatStandsDoesNothing)
         float time;
         int32_t active;
     } rows[] = {
-        {"no time has gone",  0, 0},
-        {"half a particle",   1, 0},
-        {"a whole one",       2, 1},
-        {"half again",        3, 1},
-        {"time stands still", 3, 1},
-        {"the second",        4, 2},
-        {"time goes back",    1, 2},
-        {"and on from there", 3, 3},
+        {"no time has gone", 0, 0}, {"half a particle", 1, 0},   {"a whole one", 2, 1},
+        {"half again", 3, 1},       {"time stands still", 3, 1}, {"the second", 4, 2},
+        {"time goes back", 1, 2},   {"and on from there", 3, 3},
     };
     for (const auto& row : rows)
     {

@@ -46,9 +46,7 @@ protected:
         m_kSeam->m_kSecond.m_pkMesh.Set(m_kSecond.Get());
         m_kSeam->m_kFirst.m_kPoints = {0};
         m_kSeam->m_kSecond.m_kPoints = {0};
-        m_kSeam->m_kFirst.m_kGroups = {
-            {0, 99}
-        };
+        m_kSeam->m_kFirst.m_kGroups = {{0, 99}};
         m_kSeam->m_kSecond.m_kGroups = {{0}};
         Attach(&CConnectControl::m_spkConnectData, m_kSeam.Get());
     }

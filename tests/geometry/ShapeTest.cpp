@@ -26,39 +26,26 @@ Ref<T> Shape(const std::vector<Vec3>& points)
 
 TEST(Shapes, AreHitWhereTheyStandInTheWorld)
 {
-    const Ref<CLine> line = Shape<CLine>({
-        {0,  0, 0},
-        {10, 0, 0}
-    });
+    const Ref<CLine> line = Shape<CLine>({{0, 0, 0}, {10, 0, 0}});
     const Ref<CLine> dot = Shape<CLine>({kVec3Zero, kVec3Zero});
     const Ref<CCircle> circle = Shape<CCircle>({kVec3UnitX});
     circle->m_fRadius = 2.0f;
-    const Ref<CRectangle> square = Shape<CRectangle>({
-        {0, 0, 0},
-        {2, 0, 0},
-        {2, 2, 0},
-        {0, 2, 0}
-    });
-    const Ref<CRectangle> clockwise = Shape<CRectangle>({
-        {0, 2, 0},
-        {2, 2, 0},
-        {2, 0, 0},
-        {0, 0, 0}
-    });
+    const Ref<CRectangle> square = Shape<CRectangle>({{0, 0, 0}, {2, 0, 0}, {2, 2, 0}, {0, 2, 0}});
+    const Ref<CRectangle> clockwise = Shape<CRectangle>({{0, 2, 0}, {2, 2, 0}, {2, 0, 0}, {0, 0, 0}});
     const std::tuple<const char*, CShape*, Vec3, bool> rows[] = {
-        {"beside the line",       line.Get(),      {5, 4.9f, 100},  true },
-        {"at the tolerance",      line.Get(),      {5, 5, 100},     false},
-        {"beside its first end",  line.Get(),      {0, 1, 100},     false},
-        {"beyond its second end", line.Get(),      {10.1f, 1, 100}, false},
-        {"on its first end",      line.Get(),      {0, 0, 100},     false},
-        {"in the model's place",  line.Get(),      {5, 0, 0},       false},
-        {"both ends equal",       dot.Get(),       {0, 0, 101},     false},
-        {"at the radius",         circle.Get(),    {3, 0, 100},     true },
-        {"outside the circle",    circle.Get(),    {3.01f, 0, 100}, false},
-        {"inside, seen along Z",  square.Get(),    {1, 1, -7},      true },
-        {"on an edge",            square.Get(),    {2, 1, 100},     false},
-        {"outside",               square.Get(),    {3, 1, 100},     false},
-        {"the other way round",   clockwise.Get(), {1, 1, 100},     true },
+        {"beside the line", line.Get(), {5, 4.9f, 100}, true},
+        {"at the tolerance", line.Get(), {5, 5, 100}, false},
+        {"beside its first end", line.Get(), {0, 1, 100}, false},
+        {"beyond its second end", line.Get(), {10.1f, 1, 100}, false},
+        {"on its first end", line.Get(), {0, 0, 100}, false},
+        {"in the model's place", line.Get(), {5, 0, 0}, false},
+        {"both ends equal", dot.Get(), {0, 0, 101}, false},
+        {"at the radius", circle.Get(), {3, 0, 100}, true},
+        {"outside the circle", circle.Get(), {3.01f, 0, 100}, false},
+        {"inside, seen along Z", square.Get(), {1, 1, -7}, true},
+        {"on an edge", square.Get(), {2, 1, 100}, false},
+        {"outside", square.Get(), {3, 1, 100}, false},
+        {"the other way round", clockwise.Get(), {1, 1, 100}, true},
     };
     for (const auto& [what, shape, place, hit] : rows)
     {

@@ -66,12 +66,12 @@ TEST_F(Skin, WhatWeightsLackGoesToTheMeshAndTooMuchDividesThePoint)
         std::vector<Influence> influences;
         Vec3 expected;
     } rows[] = {
-        {"no bone",          {},                                         {1, 10, 0}  },
-        {"weight 0",         {{m_kA.Get(), 0}},                          {1, 10, 0}  },
-        {"one bone",         {{m_kA.Get(), 1}},                          {101, 0, 0} },
-        {"half of the rest", {{m_kA.Get(), 0.25f}, {m_kB.Get(), 0.25f}}, {26, 5, 25} },
-        {"too much",         {{m_kA.Get(), 1}, {m_kB.Get(), 1}},         {51, 0, 50} },
-        {"below nothing",    {{m_kA.Get(), -1}},                         {-99, 20, 0}},
+        {"no bone", {}, {1, 10, 0}},
+        {"weight 0", {{m_kA.Get(), 0}}, {1, 10, 0}},
+        {"one bone", {{m_kA.Get(), 1}}, {101, 0, 0}},
+        {"half of the rest", {{m_kA.Get(), 0.25f}, {m_kB.Get(), 0.25f}}, {26, 5, 25}},
+        {"too much", {{m_kA.Get(), 1}, {m_kB.Get(), 1}}, {51, 0, 50}},
+        {"below nothing", {{m_kA.Get(), -1}}, {-99, 20, 0}},
     };
     for (const auto& row : rows)
     {
@@ -88,11 +88,7 @@ TEST_F(Skin, WhatWeightsLackGoesToTheMeshAndTooMuchDividesThePoint)
 
 TEST_F(Skin, OffsetsTakeTheModelToTheBoneAndTheFirstOneStays)
 {
-    CBoneSkinControl& skin = Attach<CBoneSkinControl>(
-        {
-            {m_kA.Get(), 0.5f}
-    },
-        Moved(0, 0, 7));
+    CBoneSkinControl& skin = Attach<CBoneSkinControl>({{m_kA.Get(), 0.5f}}, Moved(0, 0, 7));
     skin.AddInfluence(*m_kA, 0, 0.5f, Moved(0, 0, 99));
     skin.AddInfluence(*m_kA, 5, 1.0f, kMat4Identity); // no such point
     skin.RebuildSkinTables();
@@ -111,13 +107,10 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
     m_kMesh->UpdateScene(0.0f, false);
     CBoneSkinControl& skin = Attach<CBoneSkinControl>({});
     const std::tuple<CNode*, uint32_t, float> influences[] = {
-        {m_kA.Get(), 6, 0.5f },
-        {m_kA.Get(), 2, 0.25f},
-        {m_kA.Get(), 3, 1.0f },
-        {m_kA.Get(), 9, 1.0f }, // no such point
-        {m_kB.Get(), 6, 2.0f },
-        {m_kB.Get(), 4, 0.0f }, // acts on nothing
-        {m_kB.Get(), 6, 3.0f },
+        {m_kA.Get(), 6, 0.5f}, {m_kA.Get(), 2, 0.25f},
+        {m_kA.Get(), 3, 1.0f}, {m_kA.Get(), 9, 1.0f}, // no such point
+        {m_kB.Get(), 6, 2.0f}, {m_kB.Get(), 4, 0.0f}, // acts on nothing
+        {m_kB.Get(), 6, 3.0f},
     };
     for (const auto& [bone, point, weight] : influences)
         skin.AddInfluence(*bone, point, weight, kMat4Identity);
@@ -139,12 +132,7 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
                 groups.back().push_back(point);
         }
     }
-    EXPECT_EQ(groups, (std::vector<std::vector<uint32_t>>{
-                          {0,                           1, 4, 5, 7},
-                          {2,                          3},
-                          {                          },
-                          {6}
-    }));
+    EXPECT_EQ(groups, (std::vector<std::vector<uint32_t>>{{0, 1, 4, 5, 7}, {2, 3}, {}, {6}}));
     m_kMesh->SetPointCount(3);
     Update();
     EXPECT_EQ(skin.Points().size(), 1u) << "made again for another number of points";
@@ -156,12 +144,8 @@ TEST_F(Skin, TablesListPointsInOrderAndGroupThemByTheirInfluences)
 
 TEST_F(Skin, ASecondSkinStartsFromTheWorld)
 {
-    Attach<CBoneSkinControl>({
-        {m_kA.Get(), 1}
-    });
-    Attach<CBoneSkinControl>({
-        {m_kB.Get(), 1}
-    });
+    Attach<CBoneSkinControl>({{m_kA.Get(), 1}});
+    Attach<CBoneSkinControl>({{m_kB.Get(), 1}});
     Update();
     ExpectPoint(Point(0), {101, -10, 100}); // back to the model and on with the second bone
     ExpectPoint(Point(1), {0, 20, 1});      // with the mesh twice
@@ -169,12 +153,8 @@ TEST_F(Skin, ASecondSkinStartsFromTheWorld)
 
 TEST_F(Skin, ByPointAPlaceIsTheSumOfItsBonesAndOthersCollapse)
 {
-    CSkinBoneControl& skin = Attach<CSkinBoneControl>(
-        {
-            {m_kA.Get(), 0.5f},
-            {m_kB.Get(), 0.5f}
-    },
-        Moved(0, 0, 8));
+    CSkinBoneControl& skin =
+        Attach<CSkinBoneControl>({{m_kA.Get(), 0.5f}, {m_kB.Get(), 0.5f}}, Moved(0, 0, 8));
     for (const uint32_t point : {9u, 4u}) // no such points
         skin.AddInfluence(*m_kA, point, 1.0f, kMat4Identity);
     EXPECT_EQ(skin.Points()[1].m_uiIndex, 4u) << "in ascending order";
@@ -190,12 +170,8 @@ TEST_F(Skin, ByPointAPlaceIsTheSumOfItsBonesAndOthersCollapse)
 
 TEST_F(Skin, ByPointWorksFromTheWorldOfAnEarlierSkin)
 {
-    Attach<CBoneSkinControl>({
-        {m_kA.Get(), 1}
-    });
-    Attach<CSkinBoneControl>({
-        {m_kB.Get(), 2}
-    });
+    Attach<CBoneSkinControl>({{m_kA.Get(), 1}});
+    Attach<CSkinBoneControl>({{m_kB.Get(), 2}});
     Update();
     ExpectPoint(Point(0), {202, -20, 200});
 }
@@ -203,10 +179,7 @@ TEST_F(Skin, ByPointWorksFromTheWorldOfAnEarlierSkin)
 TEST_F(Skin, BonesThatDieGiveTheirShareToTheMesh)
 {
     const Ref<CNode> lost = new CNode;
-    Attach<CBoneSkinControl>({
-        {m_kA.Get(), 0.5f},
-        {lost.Get(), 0.5f}
-    });
+    Attach<CBoneSkinControl>({{m_kA.Get(), 0.5f}, {lost.Get(), 0.5f}});
     const_cast<Ref<CNode>&>(lost) = nullptr;
     Update();
     ExpectPoint(Point(0), {51, 5, 0});
@@ -216,10 +189,7 @@ TEST_F(Skin, BindGoesOverToTheBonesOfTheSameNames)
 {
     const Ref<CNode> unnamed = new CNode;
     const std::vector<Influence> influences = {
-        {m_kA.Get(),    0.5f },
-        {m_kB.Get(),    0.25f},
-        {unnamed.Get(), 0.25f}
-    };
+        {m_kA.Get(), 0.5f}, {m_kB.Get(), 0.25f}, {unnamed.Get(), 0.25f}};
     CBoneSkinControl& byBone = Attach<CBoneSkinControl>(influences);
     CSkinBoneControl& byPoint = Attach<CSkinBoneControl>(influences);
     const Ref<CNode> other = new CNode; // has no "right"
@@ -241,14 +211,8 @@ TEST_F(Skin, BindGoesOverToTheBonesOfTheSameNames)
 TEST_F(Skin, CopiesFollowCopiedBonesAndRebindDropsTheOthers)
 {
     const Ref<CNode> outside = new CNode;
-    CBoneSkinControl& byBone = Attach<CBoneSkinControl>({
-        {m_kB.Get(),    0.5f},
-        {outside.Get(), 0.5f}
-    });
-    CSkinBoneControl& byPoint = Attach<CSkinBoneControl>({
-        {m_kB.Get(),    0.5f},
-        {outside.Get(), 0.5f}
-    });
+    CBoneSkinControl& byBone = Attach<CBoneSkinControl>({{m_kB.Get(), 0.5f}, {outside.Get(), 0.5f}});
+    CSkinBoneControl& byPoint = Attach<CSkinBoneControl>({{m_kB.Get(), 0.5f}, {outside.Get(), 0.5f}});
     m_kRoot->DetachChild(m_kB.Get());
     m_kRoot->AttachChild(new CNode);
     m_kRoot->AttachChild(m_kB.Get()); // behind the mesh

@@ -146,15 +146,8 @@ TEST(WorldNormals, AreWeightedByAreaAndZeroWhereOnlyFlatTrianglesMeet)
     mesh->SetNormalCount(4);
     mesh->SetTriangleQuantity(3);
     // Twice the area along z is 2, along x is 1; the third triangle is a line.
-    std::ranges::copy(
-        std::vector<Vec3>{
-            {0, 0, 0},
-            {2, 0, 0},
-            {0, 1, 0},
-            {0, 0, 1},
-            {1, 0, 0}
-    },
-        mesh->XYZBuffer().begin());
+    std::ranges::copy(std::vector<Vec3>{{0, 0, 0}, {2, 0, 0}, {0, 1, 0}, {0, 0, 1}, {1, 0, 0}},
+                      mesh->XYZBuffer().begin());
     std::ranges::copy(std::vector<uint32_t>{0, 1, 2, 0, 2, 3, 0, 1, 4}, mesh->XYZTriIndexBuffer().begin());
     std::ranges::copy(std::vector<uint32_t>{0, 1, 1, 0, 2, 99, 3, 3, 3},
                       mesh->NormalTriIndexBuffer().begin());

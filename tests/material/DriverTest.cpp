@@ -189,13 +189,10 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
 {
     // Rows asked for, and what comes, by the number that their pixels are made of; 0 where none comes.
     const std::tuple<const char*, int, bool, std::string_view, std::string_view> cases[] = {
-        {"a file, bottom up",  3,  false, "012",  "321" },
-        {"a file, top down",   -3, false, "012",  "123" },
-        {"a file, back again", -3, false, "20",   "31"  },
-        {"a pipe, top down",   -3, true,  "02",   "13"  },
-        {"a pipe, bottom up",  3,  true,  "210",  "123" },
-        {"a pipe, and back",   -3, true,  "101",  "202" },
-        {"a pipe, in pieces",  3,  true,  "2200", "1133"},
+        {"a file, bottom up", 3, false, "012", "321"},  {"a file, top down", -3, false, "012", "123"},
+        {"a file, back again", -3, false, "20", "31"},  {"a pipe, top down", -3, true, "02", "13"},
+        {"a pipe, bottom up", 3, true, "210", "123"},   {"a pipe, and back", -3, true, "101", "202"},
+        {"a pipe, in pieces", 3, true, "2200", "1133"},
     };
     for (const auto& [what, height, pipe, order, rows] : cases)
     {
@@ -275,11 +272,7 @@ TEST_F(DriverTest, BMPSurvivesDamage)
             RowText(*picture, y);
         return picture != nullptr;
     };
-    for (const auto& [depth, height] : {
-             std::pair<uint16_t, int>(1, 2), {4,  -2},
-                {24, 2 },
-                {32, -2}
-    })
+    for (const auto& [depth, height] : {std::pair<uint16_t, int>(1, 2), {4, -2}, {24, 2}, {32, -2}})
     {
         const size_t colors = depth < 16 ? size_t{1} << depth : 0;
         const std::string good = MadeBMP{3, height, depth, Colors(colors), std::string(24, 'x')}.Bytes();
@@ -298,10 +291,7 @@ TEST_F(DriverTest, BMPIsWrittenTopDown)
 {
     auto picture = OpenPicture(Path(), "w");
     ASSERT_TRUE(picture);
-    const PixelRGBA pixels[] = {
-        {1, 2, 3, 4},
-        {5, 6, 7, 8}
-    };
+    const CPixelRGBA pixels[] = {{1, 2, 3, 4}, {5, 6, 7, 8}};
     EXPECT_FALSE(picture->WriteRowRGBA(0, 0, 2, pixels)) << "no size yet";
     ASSERT_TRUE(picture->SetSize({0, 0, 2, 2}));
     ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 2, pixels));
@@ -325,11 +315,7 @@ TEST_F(DriverTest, BMPOfOneChannelComesBackInGrey)
     EXPECT_FALSE(picture->SetChannelCount(2));
     ASSERT_TRUE(picture->SetChannelCount(1));
     ASSERT_TRUE(picture->SetSize({0, 0, 3, 1}));
-    const PixelRGBA pixels[] = {
-        {0,   0,   0,   9},
-        {255, 255, 255, 0},
-        {100, 100, 100, 0}
-    };
+    const CPixelRGBA pixels[] = {{0, 0, 0, 9}, {255, 255, 255, 0}, {100, 100, 100, 0}};
     ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 3, pixels));
     EXPECT_TRUE(picture->Close());
     picture = OpenPicture(Path(), "r");
@@ -385,17 +371,9 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
         const char* name;
         std::string_view driver;
     } names[] = {
-        {"a.bmp",   "bmp" },
-        {"-.bmp",   "bmp" },
-        {"a.b.GIF", "gif" },
-        {"a.PJpeg", "jpg" },
-        {"a.tiff",  "tif" },
-        {"a.ppm",   "pnm" },
-        {"a.Z",     "rle" },
-        {"a",       "none"},
-        {"a.",      "none"},
-        {"bmp",     "none"},
-        {"a.txt",   "none"},
+        {"a.bmp", "bmp"},  {"-.bmp", "bmp"}, {"a.b.GIF", "gif"}, {"a.PJpeg", "jpg"},
+        {"a.tiff", "tif"}, {"a.ppm", "pnm"}, {"a.Z", "rle"},     {"a", "none"},
+        {"a.", "none"},    {"bmp", "none"},  {"a.txt", "none"},
     };
     for (const auto& row : names)
     {
@@ -406,12 +384,8 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
     EXPECT_EQ(FindPictureType("a.z")->magic, 0x1f8b);
 
     const std::tuple<std::string_view, const char*> heads[] = {
-        {"BM123",     "bmp" },
-        {"\x50\x88",  "dump"},
-        {"-\xcc\x52", "rle" },
-        {"\x1f\x8b",  "z"   },
-        {"\xcc\x52-", ""    },
-        {"B",         ""    },
+        {"BM123", "bmp"},  {"\x50\x88", "dump"}, {"-\xcc\x52", "rle"},
+        {"\x1f\x8b", "z"}, {"\xcc\x52-", ""},    {"B", ""},
     };
     for (const auto& [bytes, extension] : heads)
     {

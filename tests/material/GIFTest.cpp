@@ -191,11 +191,7 @@ TEST(CGIFReader, PutsInterlacedRowsInOrder)
     for (const unsigned height : {1u, 2u, 3u, 5u, 8u, 9u, 21u})
     {
         Pixels stored;
-        for (const auto& [first, step] : {
-                 std::pair(0u, 8u), {4u, 8u},
-                   {2u, 4u},
-                   {1u, 2u}
-        })
+        for (const auto& [first, step] : {std::pair(0u, 8u), {4u, 8u}, {2u, 4u}, {1u, 2u}})
         {
             for (unsigned y = first; y < height; y += step)
                 stored.insert(stored.end(), 2, static_cast<uint8_t>(y));

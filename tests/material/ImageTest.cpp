@@ -17,16 +17,9 @@ TEST(PictureFiles, FormatsKeepPixelsAndResolution)
 {
     // resolution: 96 where the format keeps none
     const std::tuple<const char*, int32_t, int, int32_t> rows[] = {
-        {"a.png",  0, 0, 300},
-        {"a.PNG",  1, 0, 300},
-        {"a.bmp",  0, 0, 300},
-        {"a.tga",  1, 0, 96 },
-        {"a.tif",  0, 0, 300},
-        {"a.gif",  0, 2, 96 },
-        {"a.jpg",  1, 6, 300},
-        {"a.jpeg", 0, 6, 300},
-        {"a.pcx",  1, 0, 300},
-        {"a.ppm",  1, 0, 96 },
+        {"a.png", 0, 0, 300}, {"a.PNG", 1, 0, 300}, {"a.bmp", 0, 0, 300}, {"a.tga", 1, 0, 96},
+        {"a.tif", 0, 0, 300}, {"a.gif", 0, 2, 96},  {"a.jpg", 1, 6, 300}, {"a.jpeg", 0, 6, 300},
+        {"a.pcx", 1, 0, 300}, {"a.ppm", 1, 0, 96},
     };
     const CTempFolder folder;
     for (const auto& [name, format, tolerance, resolution] : rows)
@@ -154,15 +147,15 @@ TEST(CImage, OddPixelsOfAFileAreReadOrRefused)
         uint16_t storage;
         bool whole;
     } rows[] = {
-        {"a size without pixels", 10,         10,         0, 0, 0,  true },
-        {"no width",              0,          9,          0, 1, 1,  true },
-        {"no height",             9,          0,          0, 1, 0,  true },
-        {"as many as there are",  2,          2,          0, 9, 77, true },
-        {"no such format",        1,          1,          6, 1, 0,  false},
-        {"below 0",               0xffffffff, 1,          0, 1, 0,  false},
-        {"above 0 as a product",  0xffffffff, 0xffffffff, 0, 1, 1,  false},
-        {"more than there are",   99,         99,         5, 1, 0,  false},
-        {"a product of 34 bits",  65536,      65536,      0, 1, 1,  false},
+        {"a size without pixels", 10, 10, 0, 0, 0, true},
+        {"no width", 0, 9, 0, 1, 1, true},
+        {"no height", 9, 0, 0, 1, 0, true},
+        {"as many as there are", 2, 2, 0, 9, 77, true},
+        {"no such format", 1, 1, 6, 1, 0, false},
+        {"below 0", 0xffffffff, 1, 0, 1, 0, false},
+        {"above 0 as a product", 0xffffffff, 0xffffffff, 0, 1, 1, false},
+        {"more than there are", 99, 99, 5, 1, 0, false},
+        {"a product of 34 bits", 65536, 65536, 0, 1, 1, false},
     };
     for (const auto& row : rows)
     {
@@ -240,8 +233,8 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
         uint32_t delay;
         uint8_t green;
     } rows[] = {
-        {0, 2, 70, 0  },
-        {1, 1, 5,  255},
+        {0, 2, 70, 0},
+        {1, 1, 5, 255},
     };
     for (size_t i = 0; i < 2; ++i)
     {
@@ -291,10 +284,10 @@ TEST(CAnmImageControl, DrawsTheFrameOfItsTimeAtItsPlace)
         float time;
         std::array<uint8_t, 3> shades;
     } rows[] = {
-        {"before the second frame", 69.0f,  {10, 0, 0}},
-        {"with it",                 70.0f,  {0, 20, 0}},
-        {"with the empty one",      500.0f, {0, 0, 0} },
-        {"back again",              1.0f,   {10, 0, 0}},
+        {"before the second frame", 69.0f, {10, 0, 0}},
+        {"with it", 70.0f, {0, 20, 0}},
+        {"with the empty one", 500.0f, {0, 0, 0}},
+        {"back again", 1.0f, {10, 0, 0}},
     };
     uint32_t stamp = screen->m_uiChangeStamp;
     for (const auto& row : rows)

@@ -67,21 +67,21 @@ TEST(LinkNames, LeadWhereTheRuleSays)
     WriteBytes(there, "x");
     // path: below the folder /scenes, or from the root
     const std::tuple<std::string, const char*> rows[] = {
-        {"a.png",                      "a.png"     },
-        {"textures\\a.png",            "a.png"     },
-        {"textures/a.png",             "a.png"     },
-        {"textures\\wood\\a.png",      "wood/a.png"},
-        {"..\\a.png",                  "a.png"     },
-        {".\\wood//.\\a.png",          "wood/a.png"},
-        {"C:\\art\\wood\\a.png",       "a.png"     },
-        {"\\\\server\\share\\a.png",   "a.png"     },
-        {"/nowhere/at/all/a.png",      "a.png"     },
-        {"C:a.png",                    "C:a.png"   },
-        {"\\a.png",                    "a.png"     },
-        {"x\\..\\a.png",               "a.png"     },
-        {"x/../../etc/a.png",          "a.png"     },
-        {"x\\wood\\..\\..\\..\\a.png", "a.png"     },
-        {"x\\wood\\..\\oak\\a.png",    "oak/a.png" },
+        {"a.png", "a.png"},
+        {"textures\\a.png", "a.png"},
+        {"textures/a.png", "a.png"},
+        {"textures\\wood\\a.png", "wood/a.png"},
+        {"..\\a.png", "a.png"},
+        {".\\wood//.\\a.png", "wood/a.png"},
+        {"C:\\art\\wood\\a.png", "a.png"},
+        {"\\\\server\\share\\a.png", "a.png"},
+        {"/nowhere/at/all/a.png", "a.png"},
+        {"C:a.png", "C:a.png"},
+        {"\\a.png", "a.png"},
+        {"x\\..\\a.png", "a.png"},
+        {"x/../../etc/a.png", "a.png"},
+        {"x\\wood\\..\\..\\..\\a.png", "a.png"},
+        {"x\\wood\\..\\oak\\a.png", "oak/a.png"},
     };
     for (const auto& [name, path] : rows)
     {
@@ -101,14 +101,14 @@ TEST(LinkNames, LeadWhereTheRuleSays)
 TEST(LinkNames, AreStoredSoThatTheyLeadBack)
 {
     const std::tuple<const char*, const char*> rows[] = {
-        {"/scenes/a.png",          "a.png"                 },
-        {"/scenes/wood/oak/a.png", ".\\wood\\oak\\a.png"   },
-        {"/scenes/x/../a.png",     "a.png"                 },
-        {"/scenes/12:30.png",      "12:30.png"             },
-        {"/scenes2/a.png",         "/scenes2/a.png"        },
-        {"/a.png",                 "/a.png"                },
-        {"C:\\art\\a.png",         "C:\\art\\a.png"        },
-        {"\\\\server\\a.png",      "\\\\server\\a.png"     },
+        {"/scenes/a.png", "a.png"},
+        {"/scenes/wood/oak/a.png", ".\\wood\\oak\\a.png"},
+        {"/scenes/x/../a.png", "a.png"},
+        {"/scenes/12:30.png", "12:30.png"},
+        {"/scenes2/a.png", "/scenes2/a.png"},
+        {"/a.png", "/a.png"},
+        {"C:\\art\\a.png", "C:\\art\\a.png"},
+        {"\\\\server\\a.png", "\\\\server\\a.png"},
         {"/scenes/wood/12:30.png", "/scenes/wood/12:30.png"},
     };
     for (const auto& [path, stored] : rows)

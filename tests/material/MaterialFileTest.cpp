@@ -77,8 +77,8 @@ TEST(MaterialFile, AsManyTexturesAreReadAsAreStoredAndTwelveAreKept)
         std::initializer_list<uint32_t> stored;
         std::initializer_list<uint32_t> kept;
     } rows[] = {
-        {"none",     {},                                      {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
-        {"one",      {7},                                     {2, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"none", {}, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
+        {"one", {7}, {2, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
         {"thirteen", {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 7, 0, 7}, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 2, 0}},
     };
     for (const auto& row : rows)

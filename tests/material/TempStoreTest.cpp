@@ -88,11 +88,7 @@ TEST_F(TempStore, ABlockKeepsItsBytesWhileNobodyLooks)
     const uint32_t small = m_kStore.Allocate(3 * kPage);
     const uint32_t other = m_kStore.Allocate(kPage);
     const uint32_t large = m_kStore.Allocate(kFile + 5);
-    for (const auto& [handle, size] : {
-             std::pair{small, 3 * kPage},
-             {other, kPage    },
-             {large, kFile + 5}
-    })
+    for (const auto& [handle, size] : {std::pair{small, 3 * kPage}, {other, kPage}, {large, kFile + 5}})
     {
         std::byte* const bytes = m_kStore.Map(handle);
         ASSERT_NE(bytes, nullptr);
@@ -102,11 +98,7 @@ TEST_F(TempStore, ABlockKeepsItsBytesWhileNobodyLooks)
         bytes[size - 1] = std::byte{77}; // the first use still holds
         m_kStore.Unmap(handle);
     }
-    for (const auto& [handle, size] : {
-             std::pair{small, 3 * kPage},
-             {other, kPage    },
-             {large, kFile + 5}
-    })
+    for (const auto& [handle, size] : {std::pair{small, 3 * kPage}, {other, kPage}, {large, kFile + 5}})
     {
         std::byte* const bytes = m_kStore.Map(handle);
         EXPECT_EQ(bytes[0], static_cast<std::byte>(handle >> 16 ^ handle));

@@ -9,9 +9,7 @@ namespace gw {
 
 namespace {
 
-const Mat4 kSkewed{
-    {2, 1, 0, 0.5f, -1, 3, 1, 0, 0, 4, -2, 0.25f, 7, -8, 9, 1}
-};
+const Mat4 kSkewed{{2, 1, 0, 0.5f, -1, 3, 1, 0, 0, 4, -2, 0.25f, 7, -8, 9, 1}};
 
 void ExpectNear(const Mat4& a, const Mat4& b)
 {
@@ -61,20 +59,12 @@ TEST(Mat3, OutputsMayBeInputs)
 
 TEST(Mat3, TheInverseIsGeneralAndNeverFails)
 {
-    const Mat3 skewed{
-        {2, 1, 0, -1, 3, 1, 0, 4, -2}
-    };
+    const Mat3 skewed{{2, 1, 0, -1, 3, 1, 0, 4, -2}};
     const Mat3 product = skewed * Mat3InverseOrIdentity(skewed);
     for (int i = 0; i < 9; ++i)
         EXPECT_NEAR(product.m[i], kMat3Identity.m[i], 1e-6) << i;
-    EXPECT_EQ(Mat3InverseOrIdentity({
-                  {1, 2, 3, 2, 4, 6, 0, 0, 1}
-    }),
-              kMat3Identity);
-    EXPECT_EQ(Mat3InverseOrIdentity({
-                  {NAN, 0, 0, 0, 1, 0, 0, 0, 1}
-    }),
-              kMat3Identity);
+    EXPECT_EQ(Mat3InverseOrIdentity({{1, 2, 3, 2, 4, 6, 0, 0, 1}}), kMat3Identity);
+    EXPECT_EQ(Mat3InverseOrIdentity({{NAN, 0, 0, 0, 1, 0, 0, 0, 1}}), kMat3Identity);
 }
 
 TEST(Mat4, ComposeScalesThenTurnsThenMoves)
@@ -139,12 +129,12 @@ TEST(Mat4, TheInverseIsGeneralAndLeavesItsOutputWhereItFails)
 TEST(Mat4, CoordinatesAreDividedUnlessTheFourthIsOne)
 {
     const std::tuple<const char*, float, float> rows[] = {
-        {"one",                                        1.0f,            3.0f    },
-        {"one within the tolerance, its end included", 1.0f + kEpsilon, 3.0f    },
-        {"one, from below",                            1.0f - kEpsilon, 3.0f    },
-        {"two",                                        2.0f,            1.5f    },
-        {"negative",                                   -1.0f,           -3.0f   },
-        {"zero",                                       0.0f,            INFINITY},
+        {"one", 1.0f, 3.0f},
+        {"one within the tolerance, its end included", 1.0f + kEpsilon, 3.0f},
+        {"one, from below", 1.0f - kEpsilon, 3.0f},
+        {"two", 2.0f, 1.5f},
+        {"negative", -1.0f, -3.0f},
+        {"zero", 0.0f, INFINITY},
     };
     for (const auto& [what, w, x] : rows)
     {

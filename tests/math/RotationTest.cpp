@@ -99,18 +99,18 @@ TEST(Euler, QuarterTurnsOfTheMiddleAngle)
         float second;
         Vec3 degrees;
     } rows[] = {
-        {"XYZ up",   "YX", 0, 90.0f,  30.0f,  {-30.0f, -90.0f, 0.0f}},
-        {"XYZ down", "YX", 0, -90.0f, 30.0f,  {-30.0f, 90.0f, 0.0f} },
-        {"ZYX up",   "YZ", 1, 90.0f,  30.0f,  {0.0f, -90.0f, -30.0f}},
-        {"ZYX down", "YZ", 1, -90.0f, 30.0f,  {0.0f, 90.0f, 150.0f} },
-        {"XZY up",   "ZX", 2, 90.0f,  30.0f,  {30.0f, 0.0f, -90.0f} },
-        {"XZY down", "ZX", 2, -90.0f, 30.0f,  {30.0f, 0.0f, 90.0f}  },
-        {"YZX up",   "ZY", 3, 90.0f,  30.0f,  {0.0f, -30.0f, -90.0f}},
-        {"YZX down", "ZY", 3, -90.0f, 30.0f,  {0.0f, -30.0f, 90.0f} },
-        {"ZXY up",   "XZ", 4, 90.0f,  30.0f,  {90.0f, 0.0f, 30.0f}  },
-        {"ZXY down", "XZ", 4, -90.0f, 30.0f,  {-90.0f, 0.0f, 30.0f} },
-        {"YXZ up",   "ZX", 5, 30.0f,  90.0f,  {90.0f, 0.0f, 30.0f}  },
-        {"YXZ down", "ZX", 5, 30.0f,  -90.0f, {-90.0f, 0.0f, 30.0f} },
+        {"XYZ up", "YX", 0, 90.0f, 30.0f, {-30.0f, -90.0f, 0.0f}},
+        {"XYZ down", "YX", 0, -90.0f, 30.0f, {-30.0f, 90.0f, 0.0f}},
+        {"ZYX up", "YZ", 1, 90.0f, 30.0f, {0.0f, -90.0f, -30.0f}},
+        {"ZYX down", "YZ", 1, -90.0f, 30.0f, {0.0f, 90.0f, 150.0f}},
+        {"XZY up", "ZX", 2, 90.0f, 30.0f, {30.0f, 0.0f, -90.0f}},
+        {"XZY down", "ZX", 2, -90.0f, 30.0f, {30.0f, 0.0f, 90.0f}},
+        {"YZX up", "ZY", 3, 90.0f, 30.0f, {0.0f, -30.0f, -90.0f}},
+        {"YZX down", "ZY", 3, -90.0f, 30.0f, {0.0f, -30.0f, 90.0f}},
+        {"ZXY up", "XZ", 4, 90.0f, 30.0f, {90.0f, 0.0f, 30.0f}},
+        {"ZXY down", "XZ", 4, -90.0f, 30.0f, {-90.0f, 0.0f, 30.0f}},
+        {"YXZ up", "ZX", 5, 30.0f, 90.0f, {90.0f, 0.0f, 30.0f}},
+        {"YXZ down", "ZX", 5, 30.0f, -90.0f, {-90.0f, 0.0f, 30.0f}},
     };
     for (const auto& row : rows)
     {
@@ -141,9 +141,7 @@ TEST(Euler, DegreesRebuildAWholeTurnAndAreNeverNaN)
                   Mat3ToEulerDegrees(NormalizedRows(scaled)));
     }
     ExpectNear(Mat3ToEulerDegrees(About('X', -100.0f)), {260.0f, 0.0f, 0.0f}, 1e-3);
-    const Mat3 upright{
-        {0, 0, -1, 0, 1, 0, 1, 0, 0}
-    }; // a quotient of 0 by 0, and the sine at its end
+    const Mat3 upright{{0, 0, -1, 0, 1, 0, 1, 0, 0}}; // a quotient of 0 by 0, and the sine at its end
     ExpectNear(Mat3ToEulerDegrees(upright), {0.0f, -90.0f, 0.0f}, 1e-3);
 }
 
@@ -175,14 +173,8 @@ TEST(Quat, MatricesComeBackAlsoFromHalfTurns)
     const float s = std::sqrt(1.0f / 3.0f);
     // Of the last one only the largest element gives all digits.
     const Vec3 axes[] = {
-        {1.0f, 0.0f,       0.0f  },
-        {0.0f, 1.0f,       0.0f  },
-        {0.0f, 0.0f,       1.0f  },
-        {r,    r,          0.0f  },
-        {0.0f, -r,         r     },
-        {r,    0.0f,       -r    },
-        {s,    s,          -s    },
-        {0.0f, 0.9999995f, 0.001f},
+        {1.0f, 0.0f, 0.0f}, {0.0f, 1.0f, 0.0f}, {0.0f, 0.0f, 1.0f}, {r, r, 0.0f},
+        {0.0f, -r, r},      {r, 0.0f, -r},      {s, s, -s},         {0.0f, 0.9999995f, 0.001f},
     };
     for (const Vec3& axis : axes)
     {
@@ -200,9 +192,7 @@ TEST(Quat, MatricesComeBackAlsoFromHalfTurns)
     }
     EXPECT_EQ(QuatFromMat3(kMat3Identity), kQuatIdentity);
     EXPECT_EQ(QuatToMat3(kQuatIdentity), kMat3Identity);
-    const Mat3 halfTurn{
-        {1, 0, 0, 0, -1, 0, 0, 0, -1}
-    };
+    const Mat3 halfTurn{{1, 0, 0, 0, -1, 0, 0, 0, -1}};
     EXPECT_EQ(QuatFromMat3(halfTurn), (Quat{0.0f, 1.0f, 0.0f, 0.0f}));
 }
 

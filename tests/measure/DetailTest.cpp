@@ -65,9 +65,7 @@ TEST(ConversionDetail, WhatIsNotMappedHasNoCurve)
 {
     CMadeFigure source;
     CMadeFigure result;
-    const std::vector<BonePair> pairs{
-        {&result.Bone("LHand"), &source.Bone("LHand")}
-    };
+    const std::vector<BonePair> pairs{{&result.Bone("LHand"), &source.Bone("LHand")}};
     ConversionDetail detail;
     const MotionClip clip = source.Record(5, kStill);
     MeasureConversion(clip, result.Record(5, kStill), pairs, &detail);
@@ -132,8 +130,8 @@ TEST(WorstFrames, AreThoseOfTheFaultsThatWereMade)
         double amount;
     } rows[] = {
         {EFrameFault::Direction, 20, 60.0 / static_cast<double>(measured.detail.mainBones.size())},
-        {EFrameFault::KneePop,   40, 14.0                                                        },
-        {EFrameFault::Slide,     77, 150.0                                                       },
+        {EFrameFault::KneePop, 40, 14.0},
+        {EFrameFault::Slide, 77, 150.0},
     };
     ASSERT_EQ(worst.size(), std::size(rows));
     for (size_t i = 0; i < worst.size(); ++i)

@@ -63,11 +63,11 @@ TEST(MeasureConversion, DirectionLeadsToTheNextJointThatIsAway)
         const char* targetChild;
         const char* sourceChild;
     } rows[] = {
-        {"a hip leads along its spine",     "LowerTorso", "UpperTorso", "UpperTorso"},
-        {"a chest leads to its neck",       "UpperTorso", "Neck",       "Neck"      },
-        {"helpers at one place are passed", "LForearm",   "LHand",      "Wrist"     },
-        {"a foot leads to its toe",         "LFoot",      "LToe",       "LToe"      },
-        {"an end joint leads nowhere",      "Head",       "",           ""          },
+        {"a hip leads along its spine", "LowerTorso", "UpperTorso", "UpperTorso"},
+        {"a chest leads to its neck", "UpperTorso", "Neck", "Neck"},
+        {"helpers at one place are passed", "LForearm", "LHand", "Wrist"},
+        {"a foot leads to its toe", "LFoot", "LToe", "LToe"},
+        {"an end joint leads nowhere", "Head", "", ""},
     };
     for (const auto& row : rows)
     {
@@ -154,12 +154,12 @@ TEST(MeasureConversion, ResultOfAnotherRateIsSampledAtTheSourcesInstants)
         double scale;
         int compared;
     } rows[] = {
-        {"interactive save at 30",        101, 404, 4.0,         101},
-        {"at 25: 484.8 frames are cut",   101, 484, 4.8,         101},
-        {"at 120",                        101, 101, 1.0,         101},
-        {"at 240: half of an odd number", 101, 50,  0.5,         99 },
-        {"at 7",                          33,  565, 120.0 / 7.0, 33 },
-        {"a scale of no whole rate",      101, 333, 333.0 / 101, 101},
+        {"interactive save at 30", 101, 404, 4.0, 101},
+        {"at 25: 484.8 frames are cut", 101, 484, 4.8, 101},
+        {"at 120", 101, 101, 1.0, 101},
+        {"at 240: half of an odd number", 101, 50, 0.5, 99},
+        {"at 7", 33, 565, 120.0 / 7.0, 33},
+        {"a scale of no whole rate", 101, 333, 333.0 / 101, 101},
     };
     for (const auto& row : rows)
     {

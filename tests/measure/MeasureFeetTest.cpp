@@ -106,33 +106,47 @@ TEST(FindContacts, ThresholdsHaveASlack)
         std::vector<int> borders; // first frame and end of each contact
     } rows[] = {
         {"it hovers where a stand begins",
-         30.0,  [](int f) {
+         30.0,
+         [](int f) {
              return Vec3{0.0f, f % 8 < 4 ? 46.0f : 50.0f, 0.0f};
-         },  {0, 60}       },
+         },
+         {0, 60}},
         {"it rises above where one ends",
-         30.0,  [](int f) {
+         30.0,
+         [](int f) {
              return Vec3{0.0f, f < 20 ? 0.0f : 85.0f, 0.0f};
-         },  {0, 20}       },
+         },
+         {0, 20}},
         {"it hovers too high from the start",
-         30.0,  [](int) {
+         30.0,
+         [](int) {
              return Vec3{0.0f, 60.0f, 0.0f};
-         },  {}            },
+         },
+         {}},
         {"it drifts faster and faster",
-         30.0,  [](int f) {
+         30.0,
+         [](int f) {
              return Vec3{0.2f * static_cast<float>(f * f), 0.0f, 0.0f};
-         },  {0, 41}       },
+         },
+         {0, 41}},
         {"it brushes the floor",
-         30.0,  [](int f) {
+         30.0,
+         [](int f) {
              return Vec3{0.0f, f % 30 < 2 ? 0.0f : 90.0f, 0.0f};
-         },  {}            },
+         },
+         {}},
         {"it taps the floor for a tenth of a second",
-         30.0,  [](int f) {
+         30.0,
+         [](int f) {
              return Vec3{0.0f, f % 30 < 3 ? 0.0f : 90.0f, 0.0f};
-         },  {0, 3, 30, 33}},
+         },
+         {0, 3, 30, 33}},
         {"a fast recording shakes",
-         120.0, [](int f) {
+         120.0,
+         [](int f) {
              return Vec3{f % 2 == 0 ? 3.0f : -3.0f, 0.0f, 0.0f};
-         }, {0, 60}       },
+         },
+         {0, 60}},
     };
     for (const auto& row : rows)
     {
@@ -157,11 +171,11 @@ TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
         double resultDrift;
         double unit; // of the source
     } rows[] = {
-        {"the result slides",           0.0,  25.0, 1.0   },
-        {"a source in metres",          0.0,  25.0, 0.001 },
-        {"a source of half the size",   0.0,  25.0, 0.0005},
-        {"both slide, the result more", 10.0, 35.0, 0.1   },
-        {"the result slides less",      30.0, 5.0,  0.001 },
+        {"the result slides", 0.0, 25.0, 1.0},
+        {"a source in metres", 0.0, 25.0, 0.001},
+        {"a source of half the size", 0.0, 25.0, 0.0005},
+        {"both slide, the result more", 10.0, 35.0, 0.1},
+        {"the result slides less", 30.0, 5.0, 0.001},
     };
     for (const auto& row : rows)
     {
@@ -209,10 +223,10 @@ TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
         double resultTurn;
         double expected;
     } rows[] = {
-        {"out",                       0.0,   11.0,   11.0 },
-        {"in",                        0.0,   -11.0,  -11.0},
-        {"both",                      30.0,  41.0,   11.0 },
-        {"over the back of a circle", 175.0, -174.0, 11.0 },
+        {"out", 0.0, 11.0, 11.0},
+        {"in", 0.0, -11.0, -11.0},
+        {"both", 30.0, 41.0, 11.0},
+        {"over the back of a circle", 175.0, -174.0, 11.0},
     };
     for (const auto& row : rows)
     {

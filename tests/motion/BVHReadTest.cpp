@@ -45,15 +45,15 @@ std::string Changed(const Change& change)
 TEST(TKBVHStream, ReadsTheSameMotionWhateverMeansNothing)
 {
     const Change rows[] = {
-        {"CR LF and a byte order mark",  "",              "\xef\xbb\xbf" + WithCarriageReturns(kSmallBVH)},
-        {"CR LF on some lines",          "Hips\n{\n",     "Hips\r\n{\r\n"                                },
-        {"text before and after",        "",              "a note\n\n" + Small() + "\nmore\n1 2\n"       },
-        {"lines that mean nothing",      "\tOFFSET 0 10", "\n\tCOLOUR red\n\tOFFSET 0 10"                },
-        {"commas in a row",              "11 21 31 10",   ",11,21, 31,,10"                               },
-        {"tabs and blanks around a row", "11 21 31 10",   "\t 11 \t21\t31 10"                            },
-        {"numbers of every form",        "11 21 31 10",   "+11. 0.21e2 31.000000000000000000000 1.0E+01" },
-        {"no line end at the end",       "0 0 0 90\n",    "0 0 0 90"                                     },
-        {"surplus values",               "40 50 60",      "40 50 60 70 80"                               },
+        {"CR LF and a byte order mark", "", "\xef\xbb\xbf" + WithCarriageReturns(kSmallBVH)},
+        {"CR LF on some lines", "Hips\n{\n", "Hips\r\n{\r\n"},
+        {"text before and after", "", "a note\n\n" + Small() + "\nmore\n1 2\n"},
+        {"lines that mean nothing", "\tOFFSET 0 10", "\n\tCOLOUR red\n\tOFFSET 0 10"},
+        {"commas in a row", "11 21 31 10", ",11,21, 31,,10"},
+        {"tabs and blanks around a row", "11 21 31 10", "\t 11 \t21\t31 10"},
+        {"numbers of every form", "11 21 31 10", "+11. 0.21e2 31.000000000000000000000 1.0E+01"},
+        {"no line end at the end", "0 0 0 90\n", "0 0 0 90"},
+        {"surplus values", "40 50 60", "40 50 60 70 80"},
     };
     CLoadedMotion plain(kSmallBVH, "a.bvh");
     const Mat4 expected = PosedNode(plain.motion, "Chest", 1).m_kWorldMatrix;
@@ -77,14 +77,14 @@ TEST(TKBVHStream, MakesNodesOfRootAndJoints)
         std::string tree;
         int keyCount;
     } rows[] = {
-        {{"a joint called Site", "JOINT Chest", "JOINT Site"},                     "Hips(Site)",       3},
-        {{"a joint below an end site", "\t\t\tOFFSET 0 0 5", "JOINT Tip\n{\n}\n"}, "Hips(Chest)",      3},
-        {{"a joint outside all blocks", "MOTION", "JOINT Tail\n{\n}\nMOTION"},     "Hips(Chest Tail)", 3},
-        {{"two roots", "MOTION", "ROOT Prop\n{\nCHANNELS 1 Xrotation\n}\nMOTION"}, "Hips(Chest)",      3},
-        {{"scale channels have no effect", "3 Xrotation", "3 Xscale"},             "Hips(Chest)",      3},
-        {{"surplus rows", "Frames: 3", "Frames: 2"},                               "Hips(Chest)",      2},
-        {{"no frames", "Frames: 3", "Frames: 0"},                                  "Hips(Chest)",      0},
-        {{"less than no frames", "Frames: 3", "Frames: -7"},                       "Hips(Chest)",      0},
+        {{"a joint called Site", "JOINT Chest", "JOINT Site"}, "Hips(Site)", 3},
+        {{"a joint below an end site", "\t\t\tOFFSET 0 0 5", "JOINT Tip\n{\n}\n"}, "Hips(Chest)", 3},
+        {{"a joint outside all blocks", "MOTION", "JOINT Tail\n{\n}\nMOTION"}, "Hips(Chest Tail)", 3},
+        {{"two roots", "MOTION", "ROOT Prop\n{\nCHANNELS 1 Xrotation\n}\nMOTION"}, "Hips(Chest)", 3},
+        {{"scale channels have no effect", "3 Xrotation", "3 Xscale"}, "Hips(Chest)", 3},
+        {{"surplus rows", "Frames: 3", "Frames: 2"}, "Hips(Chest)", 2},
+        {{"no frames", "Frames: 3", "Frames: 0"}, "Hips(Chest)", 0},
+        {{"less than no frames", "Frames: 3", "Frames: -7"}, "Hips(Chest)", 0},
     };
     for (const auto& row : rows)
     {
@@ -103,11 +103,11 @@ TEST(TKBVHStream, WarnsAndReadsOn)
         Change change;
         std::string record;
     } rows[] = {
-        {{"name of three words", "ROOT Hips", "ROOT Hips of mine"}, "CutName 2 Hips\n"            },
-        {{"unknown channel", "3 Xrotation Y", "3 Xrotation W"},     "UnknownChannel 9 Wrotation\n"},
-        {{"offset with an end", "OFFSET 1 2 3", "OFFSET 1 2 3;"},   "StuckNumber 4 3;\n"          },
-        {{"two numbers in one", "12 22 32", "12 22.5-7 32"},        "StuckNumber 21 22.5-7\n"     },
-        {{"short row", "40 50 60", "40 50"},                        "ShortRow 20 Chest\n"         },
+        {{"name of three words", "ROOT Hips", "ROOT Hips of mine"}, "CutName 2 Hips\n"},
+        {{"unknown channel", "3 Xrotation Y", "3 Xrotation W"}, "UnknownChannel 9 Wrotation\n"},
+        {{"offset with an end", "OFFSET 1 2 3", "OFFSET 1 2 3;"}, "StuckNumber 4 3;\n"},
+        {{"two numbers in one", "12 22 32", "12 22.5-7 32"}, "StuckNumber 21 22.5-7\n"},
+        {{"short row", "40 50 60", "40 50"}, "ShortRow 20 Chest\n"},
     };
     for (const auto& row : rows)
     {
@@ -125,41 +125,41 @@ TEST(TKBVHStream, RefusesWithReasonAndLine)
         Change change;
         const char* record;
     } rows[] = {
-        {{"root without a name", "ROOT Hips", "ROOT "},               "BadName 2 "                   },
-        {{"two opening braces", "\tOFFSET 1", "{\n\tOFFSET 1"},       "BadBrace 4 {"                 },
-        {{"no opening brace", "{\n\tOFFSET 1", "\tOFFSET 1"},         "BadBrace 14 }"                },
-        {{"brace behind the name", "Hips\n{", "Hips {"},              "BadBrace 14 }"                },
-        {{"block without an end", "}\nMOTION", "MOTION"},             "BadBrace 15 }"                },
-        {{"short offset", "OFFSET 0 10 0", "OFFSET 0 10"},            "MissingTokens 8 Chest"        },
-        {{"word as offset", "OFFSET 0 10 0", "OFFSET 0 ten 0"},       "BadNumber 8 ten"              },
-        {{"endless offset", "OFFSET 0 10 0", "OFFSET 0 1e39 0"},      "BadNumber 8 1e39"             },
-        {{"a channel fewer than counted", "6 Xpos", "7 Xpos"},        "MissingTokens 5 Hips"         },
-        {{"absurd count of channels", "6 Xpos", "2000000000 Xpos"},   "MissingTokens 5 Hips"         },
-        {{"no count of channels", "LS 3 Xrot", "LS Xrot"},            "BadNumber 9 Xrotation"        },
-        {{"blank line behind MOTION", "Frames", "\nFrames"},          "BlankLine 17 Frames:"         },
-        {{"blank line further down", "Frame T", "\r\nFrame T"},       "BlankLine 18 Frame Time:"     },
-        {{"other line behind MOTION", "Frames:", "Frames"},           "UnexpectedLine 17 Frames:"    },
-        {{"frame time as a word", "Frame T", "FrameT"},               "UnexpectedLine 18 Frame Time:"},
-        {{"no count of frames", "Frames: 3", "Frames:"},              "MissingTokens 17 Frames:"     },
-        {{"word as count of frames", "Frames: 3", "Frames: x"},       "BadNumber 17 x"               },
-        {{"frame time 0", "0.04", "0"},                               "BadNumber 18 0"               },
-        {{"frame time below 0", "0.04", "-0.04"},                     "BadNumber 18 -0.04"           },
-        {{"frame time no number", "0.04", "nan"},                     "BadNumber 18 nan"             },
-        {{"frame time 0 as a float", "0.04", "1e-99"},                "BadNumber 18 1e-99"           },
-        {{"fewer rows than frames", "s: 3", "s: 4"},                  "TooFewRows 17 Frames:"        },
-        {{"absurdly many frames", "s: 3", "s: 2000000000"},           "TooFewRows 17 Frames:"        },
-        {{"row too short for the root", "30 0 0 0 0", "30 0 0\n"},    "MissingTokens 19 Hips"        },
-        {{"blank row", "11 21", "\n11 21"},                           "BlankLine 20 "                },
-        {{"word in a row", "31 10", "31 ten"},                        "BadNumber 20 ten"             },
-        {{"not a number in a row", "31 10", "31 -nan"},               "BadNumber 20 -nan"            },
-        {{"infinity in a row", "31 10", "31 inf"},                    "BadNumber 20 inf"             },
-        {{"number too big for a float", "31 10", "31 4e38"},          "BadNumber 20 4e38"            },
-        {{"no bytes", "", ""},                                        "MissingSection 0 HIERARCHY"   },
-        {{"other text", "", "a letter\nto you\n"},                    "MissingSection 2 HIERARCHY"   },
-        {{"hierarchy alone", "", "HIERARCHY\nROOT a\n{\n}\n"},        "MissingSection 4 MOTION"      },
-        {{"motion alone", "", "MOTION\nFrames: 1\n"},                 "NoRoot 1 ROOT"                },
-        {{"hierarchy without a root", "", "HIERARCHY\nMOTION\n"},     "NoRoot 2 ROOT"                },
-        {{"joint before any root", "", "HIERARCHY\nJOINT a\n{\n}\n"}, "NoRoot 2 a"                   },
+        {{"root without a name", "ROOT Hips", "ROOT "}, "BadName 2 "},
+        {{"two opening braces", "\tOFFSET 1", "{\n\tOFFSET 1"}, "BadBrace 4 {"},
+        {{"no opening brace", "{\n\tOFFSET 1", "\tOFFSET 1"}, "BadBrace 14 }"},
+        {{"brace behind the name", "Hips\n{", "Hips {"}, "BadBrace 14 }"},
+        {{"block without an end", "}\nMOTION", "MOTION"}, "BadBrace 15 }"},
+        {{"short offset", "OFFSET 0 10 0", "OFFSET 0 10"}, "MissingTokens 8 Chest"},
+        {{"word as offset", "OFFSET 0 10 0", "OFFSET 0 ten 0"}, "BadNumber 8 ten"},
+        {{"endless offset", "OFFSET 0 10 0", "OFFSET 0 1e39 0"}, "BadNumber 8 1e39"},
+        {{"a channel fewer than counted", "6 Xpos", "7 Xpos"}, "MissingTokens 5 Hips"},
+        {{"absurd count of channels", "6 Xpos", "2000000000 Xpos"}, "MissingTokens 5 Hips"},
+        {{"no count of channels", "LS 3 Xrot", "LS Xrot"}, "BadNumber 9 Xrotation"},
+        {{"blank line behind MOTION", "Frames", "\nFrames"}, "BlankLine 17 Frames:"},
+        {{"blank line further down", "Frame T", "\r\nFrame T"}, "BlankLine 18 Frame Time:"},
+        {{"other line behind MOTION", "Frames:", "Frames"}, "UnexpectedLine 17 Frames:"},
+        {{"frame time as a word", "Frame T", "FrameT"}, "UnexpectedLine 18 Frame Time:"},
+        {{"no count of frames", "Frames: 3", "Frames:"}, "MissingTokens 17 Frames:"},
+        {{"word as count of frames", "Frames: 3", "Frames: x"}, "BadNumber 17 x"},
+        {{"frame time 0", "0.04", "0"}, "BadNumber 18 0"},
+        {{"frame time below 0", "0.04", "-0.04"}, "BadNumber 18 -0.04"},
+        {{"frame time no number", "0.04", "nan"}, "BadNumber 18 nan"},
+        {{"frame time 0 as a float", "0.04", "1e-99"}, "BadNumber 18 1e-99"},
+        {{"fewer rows than frames", "s: 3", "s: 4"}, "TooFewRows 17 Frames:"},
+        {{"absurdly many frames", "s: 3", "s: 2000000000"}, "TooFewRows 17 Frames:"},
+        {{"row too short for the root", "30 0 0 0 0", "30 0 0\n"}, "MissingTokens 19 Hips"},
+        {{"blank row", "11 21", "\n11 21"}, "BlankLine 20 "},
+        {{"word in a row", "31 10", "31 ten"}, "BadNumber 20 ten"},
+        {{"not a number in a row", "31 10", "31 -nan"}, "BadNumber 20 -nan"},
+        {{"infinity in a row", "31 10", "31 inf"}, "BadNumber 20 inf"},
+        {{"number too big for a float", "31 10", "31 4e38"}, "BadNumber 20 4e38"},
+        {{"no bytes", "", ""}, "MissingSection 0 HIERARCHY"},
+        {{"other text", "", "a letter\nto you\n"}, "MissingSection 2 HIERARCHY"},
+        {{"hierarchy alone", "", "HIERARCHY\nROOT a\n{\n}\n"}, "MissingSection 4 MOTION"},
+        {{"motion alone", "", "MOTION\nFrames: 1\n"}, "NoRoot 1 ROOT"},
+        {{"hierarchy without a root", "", "HIERARCHY\nMOTION\n"}, "NoRoot 2 ROOT"},
+        {{"joint before any root", "", "HIERARCHY\nJOINT a\n{\n}\n"}, "NoRoot 2 a"},
     };
     for (const auto& row : rows)
     {
@@ -233,11 +233,7 @@ TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)
     ASSERT_TRUE(file.loaded);
     CNode* const joint = FindNode(file.motion.motionRoot.Get(), "J");
     const auto& keys = static_cast<CKeyframeControl*>(joint->GetControl())->m_kPositionKeys;
-    EXPECT_EQ(keys, (std::vector<Vec3>{
-                        {1, 2, 0},
-                        {3, 4, 0},
-                        {5, 0, 0}
-    }));
+    EXPECT_EQ(keys, (std::vector<Vec3>{{1, 2, 0}, {3, 4, 0}, {5, 0, 0}}));
     EXPECT_EQ(file.motion.GetKeyCount(), 3);
 }
 
@@ -250,10 +246,10 @@ TEST(TKBVHStream, WarnsOfPositionsThatRepeatTheOffsets)
         std::string position;
         std::string record;
     } rows[] = {
-        {"repeated",          "0 10 0", "0 10 0",      "DoubledOffsets 14 J\n"},
-        {"all but repeated",  "0 10 0", "0.01 9.99 0", "DoubledOffsets 14 J\n"},
-        {"moved from there",  "0 10 0", "0 11 0",      ""                     },
-        {"nothing to repeat", "0 0 0",  "0 0 0",       ""                     },
+        {"repeated", "0 10 0", "0 10 0", "DoubledOffsets 14 J\n"},
+        {"all but repeated", "0 10 0", "0.01 9.99 0", "DoubledOffsets 14 J\n"},
+        {"moved from there", "0 10 0", "0 11 0", ""},
+        {"nothing to repeat", "0 0 0", "0 0 0", ""},
     };
     for (const auto& row : rows)
     {

@@ -45,15 +45,15 @@ TEST(TKBVHStream, MultipliesChannelsInFromTheLeft)
         Mat3 rotation;
         Vec3 position;
     } rows[] = {
-        {"XYZ",             "3 Xrotation Yrotation Zrotation", "20 50 -70", z * y * x,     {1, 2, 3}},
-        {"ZXY",             "3 Zrotation Xrotation Yrotation", "-70 20 50", y * x * z,     {1, 2, 3}},
-        {"YZX",             "3 Yrotation Zrotation Xrotation", "50 -70 20", x * z * y,     {1, 2, 3}},
-        {"one axis twice",  "2 Xrotation Xrotation",           "15 5",      x,             {1, 2, 3}},
-        {"one axis",        "1 Yrotation",                     "50",        y,             {1, 2, 3}},
-        {"beyond a turn",   "1 Zrotation",                     "650",       z,             {1, 2, 3}},
-        {"positions alone", "2 Zposition Xposition",           "5 6",       kMat3Identity, {7, 2, 8}},
-        {"rotation first",  "3 Zrotation Yposition Xrotation", "-70 4 20",  x * z,         {1, 6, 3}},
-        {"scales between",  "3 Zrotation Yscale Xrotation",    "-70 4 20",  x * z,         {1, 2, 3}},
+        {"XYZ", "3 Xrotation Yrotation Zrotation", "20 50 -70", z * y * x, {1, 2, 3}},
+        {"ZXY", "3 Zrotation Xrotation Yrotation", "-70 20 50", y * x * z, {1, 2, 3}},
+        {"YZX", "3 Yrotation Zrotation Xrotation", "50 -70 20", x * z * y, {1, 2, 3}},
+        {"one axis twice", "2 Xrotation Xrotation", "15 5", x, {1, 2, 3}},
+        {"one axis", "1 Yrotation", "50", y, {1, 2, 3}},
+        {"beyond a turn", "1 Zrotation", "650", z, {1, 2, 3}},
+        {"positions alone", "2 Zposition Xposition", "5 6", kMat3Identity, {7, 2, 8}},
+        {"rotation first", "3 Zrotation Yposition Xrotation", "-70 4 20", x * z, {1, 6, 3}},
+        {"scales between", "3 Zrotation Yscale Xrotation", "-70 4 20", x * z, {1, 2, 3}},
     };
     for (const auto& row : rows)
     {
@@ -97,17 +97,17 @@ TEST(TKBVHStream, PointsBoneMeshesAtTheChild)
         float length;
         Vec3 direction;
     } rows[] = {
-        {"up",              "0 3 0",  3,          {0, 1, 0}                   },
-        {"down",            "0 -3 0", 3,          {0, -1, 0}                  },
-        {"along X",         "3 0 0",  3,          {1, 0, 0}                   },
-        {"against X",       "-3 0 0", 3,          {-1, 0, 0}                  },
-        {"along Z",         "0 0 3",  3,          {0, 0, 1}                   },
-        {"against Z",       "0 0 -3", 3,          {0, 0, -1}                  },
+        {"up", "0 3 0", 3, {0, 1, 0}},
+        {"down", "0 -3 0", 3, {0, -1, 0}},
+        {"along X", "3 0 0", 3, {1, 0, 0}},
+        {"against X", "-3 0 0", 3, {-1, 0, 0}},
+        {"along Z", "0 0 3", 3, {0, 0, 1}},
+        {"against Z", "0 0 -3", 3, {0, 0, -1}},
         {"in the XY plane", "3 -3 0", 4.2426407f, {0.7071068f, -0.7071068f, 0}},
         {"in the XZ plane", "3 0 -3", 4.2426407f, {0.7071068f, 0, -0.7071068f}},
- // The two angles are taken from projections, so that a slanted bone is only nearly met.
-        {"slanted",         "3 3 3",  5.1961524f, {0.5f, 0.7071068f, 0.5f}    },
-        {"nowhere",         "0 0 0",  0,          {1, 0, 0}                   },
+        // The two angles are taken from projections, so that a slanted bone is only nearly met.
+        {"slanted", "3 3 3", 5.1961524f, {0.5f, 0.7071068f, 0.5f}},
+        {"nowhere", "0 0 0", 0, {1, 0, 0}},
     };
     for (const auto& row : rows)
     {

@@ -33,9 +33,7 @@ const std::string kLastRow = "Head 1, 0, 0, 0, 0, 1, 0, -1, 0, 0, 52, 0\n";
 
 // Where the head stands at the last frame, as the file says it: turned about X, above a torso that is turned
 // by half a turn.
-const Mat4 kHeadAtTheEnd{
-    {-1, 0, 0, 0, 0, 0, 1, 0, 0, 1, 0, 0, 7, -44, 9, 1}
-};
+const Mat4 kHeadAtTheEnd{{-1, 0, 0, 0, 0, 0, 1, 0, 0, 1, 0, 0, 7, -44, 9, 1}};
 
 void ExpectNear(const Mat4& found, const Mat4& expected)
 {
@@ -51,9 +49,7 @@ TEST(TKCHAStream, RowsAreLocalMatricesAndPositions)
     EXPECT_EQ(file.motion.GetFrequency(), 0.04f);
     EXPECT_EQ(file.motion.GetKeyCount(), 3);
     ExpectNear(PosedNode(file.motion, "Torso", 1).m_kMatrix,
-               Mat4{
-                   {0, 1, 0, 0, -1, 0, 0, 0, 0, 0, 1, 0, 4, 5, 6, 1}
-    });
+               Mat4{{0, 1, 0, 0, -1, 0, 0, 0, 0, 0, 1, 0, 4, 5, 6, 1}});
 
     const CKeyframeControl& head = TrackOf(file.motion, "Head");
     EXPECT_EQ(head.m_kRestMatrix, Mat4Compose(kMat3Identity, {0, 50, 0})) << "the first position, unturned";
@@ -81,22 +77,22 @@ TEST(TKCHAStream, EndsOneFrameEarly)
 TEST(TKCHAStream, ReadsTheSameMotionWhateverMeansNothing)
 {
     const Change rows[] = {
-        {"CR LF and a byte order mark", "",           "\xef\xbb\xbf" + WithCarriageReturns(kSmallCHA)   },
-        {"text before the header",      "[HEADER]",   "made by hand\n[HEADER]"                          },
-        {"remarks in the header",       "DataFrame",  "# remark\nColour 5\nDataFrame"                   },
-        {"a comma behind a key",        "Rate 25",    "Rate,25.9"                                       },
-        {"blank lines in sections",     "Torso 50",   "\n \t\nTorso 50"                                 },
-        {"remarks in the lengths",      "Torso 50",   "# 1\n7 7\n-Head 9\n Head 9\n\xc3\x84 9\nTorso 50"},
-        {"remarks in the hierarchy",    "Head Torso", "#Head Global\nHead Torso"                        },
-        {"remarks in the rows",         "Frame 1",    "12 rows\n\nFrame 1"                              },
-        {"another word for a frame",    "Frame 1",    "F"                                               },
-        {"another length of a name",    "Head 20.5",  "Head 20.5\nHead 99"                              },
-        {"another version",             "Number 100", "Number 722"                                      },
-        {"no blanks in a row",          "0, 52, 0",   "0,52,0"                                          },
-        {"a remark behind a row",       "0, 52, 0",   "0, 52, 0 see above"                              },
-        {"a frame more",                kLastRow,     kLastRow + "Frame 3\nTorso 0\nHead 0\n"           },
-        {"no line end at the end",      kLastRow,     kLastRow.substr(0,                                  kLastRow.size() - 1)},
-        {"a row more than segments",                             kLastRow,                kLastRow + "[END]\n"                             },
+        {"CR LF and a byte order mark", "", "\xef\xbb\xbf" + WithCarriageReturns(kSmallCHA)},
+        {"text before the header", "[HEADER]", "made by hand\n[HEADER]"},
+        {"remarks in the header", "DataFrame", "# remark\nColour 5\nDataFrame"},
+        {"a comma behind a key", "Rate 25", "Rate,25.9"},
+        {"blank lines in sections", "Torso 50", "\n \t\nTorso 50"},
+        {"remarks in the lengths", "Torso 50", "# 1\n7 7\n-Head 9\n Head 9\n\xc3\x84 9\nTorso 50"},
+        {"remarks in the hierarchy", "Head Torso", "#Head Global\nHead Torso"},
+        {"remarks in the rows", "Frame 1", "12 rows\n\nFrame 1"},
+        {"another word for a frame", "Frame 1", "F"},
+        {"another length of a name", "Head 20.5", "Head 20.5\nHead 99"},
+        {"another version", "Number 100", "Number 722"},
+        {"no blanks in a row", "0, 52, 0", "0,52,0"},
+        {"a remark behind a row", "0, 52, 0", "0, 52, 0 see above"},
+        {"a frame more", kLastRow, kLastRow + "Frame 3\nTorso 0\nHead 0\n"},
+        {"no line end at the end", kLastRow, kLastRow.substr(0, kLastRow.size() - 1)},
+        {"a row more than segments", kLastRow, kLastRow + "[END]\n"},
     };
     for (const Change& row : rows)
     {
@@ -122,30 +118,37 @@ TEST(TKCHAStream, ReadsOddFilesAsTheyStand)
         const char* record;
     } rows[] = {
         {{"unknown parent", "Head Torso", "Head Body"},
-         "Torso",                                                                                 0,
-         "UnknownSegment 13 Body\nUnknownSegment 23 Head\n"                                                                    },
+         "Torso",
+         0,
+         "UnknownSegment 13 Body\nUnknownSegment 23 Head\n"},
         {{"parent in small letters", "Head Torso", "Head global"},
-         "Torso",                                                                                 0,
-         "UnknownSegment 13 global\nUnknownSegment 23 Head\n"                                                                  },
-        {{"two roots", "Head Torso", "Head Global"},                               "Torso",       0, ""                        },
+         "Torso",
+         0,
+         "UnknownSegment 13 global\nUnknownSegment 23 Head\n"},
+        {{"two roots", "Head Torso", "Head Global"}, "Torso", 0, ""},
         {{"two of a name", "Head Torso", "Torso Global"},
-         "Torso",                                                                                 0,
-         "UnknownSegment 23 Head\nTooFewRows 23 Torso\n"                                                                       },
+         "Torso",
+         0,
+         "UnknownSegment 23 Head\nTooFewRows 23 Torso\n"},
         {{"a line that is not counted", "Head Torso", "Head Torso\nTail Head"},
-         "Torso(Head)",                                                                           3,
-         "BadCount 14 NumSegments\n"                                                                                           },
-        {{"no length", "Head 20.5", "Head"},                                       "Torso(Head)", 3, "MissingTokens 10 Head\n" },
+         "Torso(Head)",
+         3,
+         "BadCount 14 NumSegments\n"},
+        {{"no length", "Head 20.5", "Head"}, "Torso(Head)", 3, "MissingTokens 10 Head\n"},
         {{"a row that names nothing", "Head 1, 0, 0, 0, 0", "Hand 1, 0, 0, 0, 0"},
-         "Torso(Head)",                                                                           0,
-         "UnknownSegment 23 Hand\nTooFewRows 23 Head\n"                                                                        },
-        {{"a header that is not closed", "2\n\n[L", "2\n[L"},                      "Torso(Head)", 0, "OpenHeader 13 [HEADER]\n"},
+         "Torso(Head)",
+         0,
+         "UnknownSegment 23 Hand\nTooFewRows 23 Head\n"},
+        {{"a header that is not closed", "2\n\n[L", "2\n[L"}, "Torso(Head)", 0, "OpenHeader 13 [HEADER]\n"},
         {{"a name alone", "Head 1, 0, 0, 0, 0, 1, 0, -1, 0, 0, 52, 0", "He"},
-         "Torso(Head)",                                                                           3,
-         "ShortRow 23 He\n"                                                                                                    },
+         "Torso(Head)",
+         3,
+         "ShortRow 23 He\n"},
         {{"a key without value", "Number 100", "Number"},
-         "Torso(Head)",                                                                           3,
-         "MissingTokens 2 VersionNumber\n"                                                                                     },
-        {{"no frames", "EndFrame 2", "EndFrame -9"},                               "Torso(Head)", 0, ""                        },
+         "Torso(Head)",
+         3,
+         "MissingTokens 2 VersionNumber\n"},
+        {{"no frames", "EndFrame 2", "EndFrame -9"}, "Torso(Head)", 0, ""},
     };
     for (const auto& row : rows)
     {
@@ -167,11 +170,11 @@ TEST(TKCHAStream, ShortRowsKeepTheNumbersBefore)
         Change change;
         Vec3 position;
     } rows[] = {
-        {{"no comma before the position", "1, 4, 5, 6", "1 4, 5, 6"},  {1, 2, 3}},
-        {{"a blank before a comma", "1, 4, 5, 6", "1, 4 , 5, 6"},      {4, 2, 3}},
-        {{"a letter behind a number", "1, 4, 5, 6", "1, 4, 5x, 6"},    {4, 5, 3}},
-        {{"two commas", "1, 4, 5, 6", "1, 4,, 6"},                     {4, 2, 3}},
-        {{"the end of the line", "1, 4, 5, 6", "1, 4"},                {4, 2, 3}},
+        {{"no comma before the position", "1, 4, 5, 6", "1 4, 5, 6"}, {1, 2, 3}},
+        {{"a blank before a comma", "1, 4, 5, 6", "1, 4 , 5, 6"}, {4, 2, 3}},
+        {{"a letter behind a number", "1, 4, 5, 6", "1, 4, 5x, 6"}, {4, 5, 3}},
+        {{"two commas", "1, 4, 5, 6", "1, 4,, 6"}, {4, 2, 3}},
+        {{"the end of the line", "1, 4, 5, 6", "1, 4"}, {4, 2, 3}},
         {{"a name alone", " 0, 1, 0, -1, 0, 0, 0, 0, 1, 4, 5, 6", ""}, {1, 2, 3}},
     };
     for (const auto& row : rows)
@@ -199,32 +202,32 @@ TEST(TKCHAStream, RefusesWithReasonAndLine)
         Change change;
         const char* record;
     } rows[] = {
-        {{"no bytes", "", ""},                                                                                 "MissingSection 0 [HIERARCHY]"                  },
-        {{"other text", "", "HIERARCHY\n"},                                                                    "MissingSection 1 [HIERARCHY]"                  },
-        {{"a blank line at the top", "[HEADER]", "\n[HEADER]"},                                                "BlankLine 1 [HIERARCHY]"                       },
-        {{"two blank lines", "\n\n", "\n\n\n"},                                                                "BlankLine 8 [HIERARCHY]"                       },
-        {{"no hierarchy", "[HIERARCHY]", "[HIERARCHIES]"},                                                     "MissingSection 14 [HIERARCHY]"                 },
-        {{"no motion", "[MOTION]", "[MOVES]"},                                                                 "MissingSection 23 [MOTION]"                    },
-        {{"no root", "Torso Global", "Torso Head"},                                                            "NoRoot 14 Global"                              },
-        {{"no count of segments", "NumSegments 2\n", ""},                                                      "NoRoot 13 NumSegments\nBadCount 12 NumSegments"},
-        {{"a word as value", "EndFrame 2", "EndFrame two"},                                                    "BadNumber 5 two"                               },
-        {{"a begin before 0", "BeginFrame 0", "BeginFrame -1"},                                                "BadNumber 4 -1"                                },
-        {{"101 segments", "ments 2", "ments 101"},                                                             "TooLarge 6 NumSegments"                        },
-        {{"101 rows", "", Segments(101)},                                                                      "TooLarge 108 S100"                             },
-        {{"a word as length", "Head 20.5", "Head long"},                                                       "BadNumber 10 long"                             },
-        {{"an endless length", "Head 20.5", "Head inf"},                                                       "BadNumber 10 inf"                              },
-        {{"a long name", "Head Torso", std::string(256, 'A')},                                                 "BadName 13 *"                                  },
-        {{"a word in a row", "0, 52, 0", "0, x, 0"},                                                           "BadNumber 23 x"                                },
-        {{"no number in a row", "0, 52, 0", "0, nan, 0"},                                                      "BadNumber 23 nan"                              },
-        {{"more than any float", "0, 52, 0", "0, 1e39, 0"},                                                    "BadNumber 23 1e39"                             },
-        {{"fewer rows", kLastRow, ""},                                                                         "TooFewRows 22 Head"                            },
-        {{"a frame more", "EndFrame 2", "EndFrame 3"},                                                         "TooFewRows 23 Torso"                           },
-        {{"a segment more", "ments 2", "ments 3"},                                                             "TooFewRows 23 "                                },
-        {{"frames without end", "EndFrame 2", "EndFrame 2147483647"},                                          "TooFewRows 14 EndFrame"                        },
+        {{"no bytes", "", ""}, "MissingSection 0 [HIERARCHY]"},
+        {{"other text", "", "HIERARCHY\n"}, "MissingSection 1 [HIERARCHY]"},
+        {{"a blank line at the top", "[HEADER]", "\n[HEADER]"}, "BlankLine 1 [HIERARCHY]"},
+        {{"two blank lines", "\n\n", "\n\n\n"}, "BlankLine 8 [HIERARCHY]"},
+        {{"no hierarchy", "[HIERARCHY]", "[HIERARCHIES]"}, "MissingSection 14 [HIERARCHY]"},
+        {{"no motion", "[MOTION]", "[MOVES]"}, "MissingSection 23 [MOTION]"},
+        {{"no root", "Torso Global", "Torso Head"}, "NoRoot 14 Global"},
+        {{"no count of segments", "NumSegments 2\n", ""}, "NoRoot 13 NumSegments\nBadCount 12 NumSegments"},
+        {{"a word as value", "EndFrame 2", "EndFrame two"}, "BadNumber 5 two"},
+        {{"a begin before 0", "BeginFrame 0", "BeginFrame -1"}, "BadNumber 4 -1"},
+        {{"101 segments", "ments 2", "ments 101"}, "TooLarge 6 NumSegments"},
+        {{"101 rows", "", Segments(101)}, "TooLarge 108 S100"},
+        {{"a word as length", "Head 20.5", "Head long"}, "BadNumber 10 long"},
+        {{"an endless length", "Head 20.5", "Head inf"}, "BadNumber 10 inf"},
+        {{"a long name", "Head Torso", std::string(256, 'A')}, "BadName 13 *"},
+        {{"a word in a row", "0, 52, 0", "0, x, 0"}, "BadNumber 23 x"},
+        {{"no number in a row", "0, 52, 0", "0, nan, 0"}, "BadNumber 23 nan"},
+        {{"more than any float", "0, 52, 0", "0, 1e39, 0"}, "BadNumber 23 1e39"},
+        {{"fewer rows", kLastRow, ""}, "TooFewRows 22 Head"},
+        {{"a frame more", "EndFrame 2", "EndFrame 3"}, "TooFewRows 23 Torso"},
+        {{"a segment more", "ments 2", "ments 3"}, "TooFewRows 23 "},
+        {{"frames without end", "EndFrame 2", "EndFrame 2147483647"}, "TooFewRows 14 EndFrame"},
         {{"a far begin", "BeginFrame 0\nEndFrame 2", "BeginFrame 2147483645\nEndFrame 2147483647"},
-         "TooFewRows 14 EndFrame"                                                                                                                              },
+         "TooFewRows 14 EndFrame"},
         {{"frames without end and rows", "EndFrame 2\nNumSegments 2\n", "EndFrame 2000000000\nNumSegments 2"},
-         "OpenHeader"                                                                                                                                          },
+         "OpenHeader"},
     };
     for (const auto& row : rows)
     {

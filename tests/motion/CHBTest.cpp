@@ -43,9 +43,7 @@ std::string Pose(const Mat3& matrix, const Vec3& position)
     return Bytes(matrix) + Bytes(position);
 }
 
-constexpr Mat3 kQuarterTurn{
-    {0, 1, 0, -1, 0, 0, 0, 0, 1}
-};
+constexpr Mat3 kQuarterTurn{{0, 1, 0, -1, 0, 0, 0, 0, 1}};
 
 // Frame i of two segments: the torso stands at (i, 0, 0), unturned; the head above it at height 10 + i,
 // turned by a quarter about Z.
@@ -98,9 +96,7 @@ TEST(TKCHBStream, ReadsMatricesAndPositions)
     EXPECT_EQ(file.motion.GetFrequency(), 0.06f) << "whatever the rate in the file";
     EXPECT_EQ(file.motion.GetLastFrame(), 3.0f);
     EXPECT_EQ(file.motion.GetKeyCount(), 4);
-    const Mat4 expected{
-        {0, 1, 0, 0, -1, 0, 0, 0, 0, 0, 1, 0, 3, 13, 0, 1}
-    };
+    const Mat4 expected{{0, 1, 0, 0, -1, 0, 0, 0, 0, 0, 1, 0, 3, 13, 0, 1}};
     const Mat4 found = PosedNode(file.motion, "Head", 3).m_kWorldMatrix;
     for (int i = 0; i < 16; ++i)
         EXPECT_NEAR(found.m[i], expected.m[i], 1e-5) << i;
@@ -120,11 +116,8 @@ TEST(TKCHBStream, TakesTheBeginFrameTwice)
         Vec3 first;
         Vec3 last;
     } rows[] = {
-        {0, 9, 10, {0, 0, 0}, {9, 0, 0}},
-        {2, 9, 4,  {4, 0, 0}, {7, 0, 0}},
-        {3, 9, 1,  {6, 0, 0}, {6, 0, 0}},
-        {4, 9, 1,  {5, 0, 0}, {5, 0, 0}},
-        {6, 9, 0,  {0, 0, 0}, {0, 0, 0}},
+        {0, 9, 10, {0, 0, 0}, {9, 0, 0}}, {2, 9, 4, {4, 0, 0}, {7, 0, 0}}, {3, 9, 1, {6, 0, 0}, {6, 0, 0}},
+        {4, 9, 1, {5, 0, 0}, {5, 0, 0}},  {6, 9, 0, {0, 0, 0}, {0, 0, 0}},
     };
     for (const auto& row : rows)
     {
@@ -152,18 +145,18 @@ TEST(TKCHBStream, ReadsOddFilesAsTheyStand)
         const char* tree;
         const char* record;
     } rows[] = {
-        {"keywords in any case",      Patched(Patched(plain, 0,                    "[header]"),                     kFirstFrame - 5,                                                         "fRAME"),
+        {"keywords in any case", Patched(Patched(plain, 0, "[header]"), kFirstFrame - 5, "fRAME"),
          "Torso(Head)", ""},
-        {"an old version",                         Patched(plain,                                              kIntOffsets[0],                                                   Bytes(-5)),                                             "Torso(Head)",                                                         ""                                                         },
-        {"a name of 255 characters",                         Patched(plain,                                              kFirstName,                                         std::string(255,                                   'A')),"Torso(Head)",""},
-        {"something behind the end",              plain + "more" + Bytes(nan),                                 "Torso(Head)",                                                     ""                                                          },
-        {"something odd that is not read",                           SmallCHB(1,                 3) + Bytes(nan), "Torso(Head)",""                                                                                               },
-        {"an unknown parent",         Patched(plain,         parent,               Name("Body")),                   "Torso", "UnknownSegment 1646 Body\n"                                                                                                                                                                        },
-        {"a parent in small letters", Patched(plain,         parent,               Name("global")),                 "Torso",
-         "UnknownSegment 1646 global\n"                                                                                                                     },
-        {"two roots",                 Patched(plain,         parent,               Name("Global")),                 "Torso",                                                                 ""                                                                                                 },
-        {"its own parent",            Patched(plain,         parent,               Name("Head")),                   "Torso",                                                                 ""                                                                                                                                                                                                                   },
-        {"no frames",                 Patched(plain,         kIntOffsets[kEnd],    Bytes(-7)),                      "Torso(Head)",                                                                 ""                                                           },
+        {"an old version", Patched(plain, kIntOffsets[0], Bytes(-5)), "Torso(Head)", ""},
+        {"a name of 255 characters", Patched(plain, kFirstName, std::string(255, 'A')), "Torso(Head)", ""},
+        {"something behind the end", plain + "more" + Bytes(nan), "Torso(Head)", ""},
+        {"something odd that is not read", SmallCHB(1, 3) + Bytes(nan), "Torso(Head)", ""},
+        {"an unknown parent", Patched(plain, parent, Name("Body")), "Torso", "UnknownSegment 1646 Body\n"},
+        {"a parent in small letters", Patched(plain, parent, Name("global")), "Torso",
+         "UnknownSegment 1646 global\n"},
+        {"two roots", Patched(plain, parent, Name("Global")), "Torso", ""},
+        {"its own parent", Patched(plain, parent, Name("Head")), "Torso", ""},
+        {"no frames", Patched(plain, kIntOffsets[kEnd], Bytes(-7)), "Torso(Head)", ""},
     };
     for (const auto& row : rows)
     {
@@ -185,21 +178,21 @@ TEST(TKCHBStream, RefusesWithReasonAndByte)
         std::string bytes;
         const char* record;
     } rows[] = {
-        {"another file",             "HIERARCHY",                     "BadHeader 0 [HEADER]"         },
-        {                "version 722",             Patched(plain,                                kIntOffsets[0],             Bytes(722)), "BadVersion 25 722"},
-        {                "a begin before 0",        Patched(plain,                            kIntOffsets[kBegin],          Bytes(-1)), "BadCount 83 EndFrame"},
-        {                "101 segments",            Patched(plain,                        kIntOffsets[kSegments],       Bytes(101)), "TooLarge 83 NumSegments"},
-        {                "a segment more",          Patched(plain,                          kIntOffsets[kSegments],                                                             Bytes(3)),
+        {"another file", "HIERARCHY", "BadHeader 0 [HEADER]"},
+        {"version 722", Patched(plain, kIntOffsets[0], Bytes(722)), "BadVersion 25 722"},
+        {"a begin before 0", Patched(plain, kIntOffsets[kBegin], Bytes(-1)), "BadCount 83 EndFrame"},
+        {"101 segments", Patched(plain, kIntOffsets[kSegments], Bytes(101)), "TooLarge 83 NumSegments"},
+        {"a segment more", Patched(plain, kIntOffsets[kSegments], Bytes(3)),
          "MissingSection 871 [HIERARCHY]"},
-        {                                                                            "no segments",             Patched(plain,                          kIntOffsets[kSegments], Bytes(0)), "MissingSection 91 [HIERARCHY]"},
-        {                "frames without end",      Patched(plain,                      kIntOffsets[kEnd],          Bytes(2147483647)), "BadCount 83 EndFrame"},
-        {                "a frame more",            Patched(plain,                               kIntOffsets[kEnd],               Bytes(4)), "Truncated 2074 "},
-        {                "another number",          Patched(plain,                       kFirstFrame + kFrameBytes,                                                                Bytes(2)),
+        {"no segments", Patched(plain, kIntOffsets[kSegments], Bytes(0)), "MissingSection 91 [HIERARCHY]"},
+        {"frames without end", Patched(plain, kIntOffsets[kEnd], Bytes(2147483647)), "BadCount 83 EndFrame"},
+        {"a frame more", Patched(plain, kIntOffsets[kEnd], Bytes(4)), "Truncated 2074 "},
+        {"another number", Patched(plain, kFirstFrame + kFrameBytes, Bytes(2)),
          "MissingSection 1768 Frame 1"},
-        {                                                                               "an endless length",       Patched(plain,                         kFirstName + 256,                Bytes(infinity)), "BadNumber 351 "},
-        {                "an infinity in a matrix", Patched(plain,                          kFirstFrame + 4,               Bytes(infinity)), "BadNumber 1699 "},
-        {                "a name without an end",   Patched(plain,                                kFirstName,                           std::string(256, 'A')), "BadName 347 *"},
-        { "no root",                          Patched(plain, kFirstName + 2 * 260 + 11 + 256,                   Name("Head")), "NoRoot 2074 Global"},
+        {"an endless length", Patched(plain, kFirstName + 256, Bytes(infinity)), "BadNumber 351 "},
+        {"an infinity in a matrix", Patched(plain, kFirstFrame + 4, Bytes(infinity)), "BadNumber 1699 "},
+        {"a name without an end", Patched(plain, kFirstName, std::string(256, 'A')), "BadName 347 *"},
+        {"no root", Patched(plain, kFirstName + 2 * 260 + 11 + 256, Name("Head")), "NoRoot 2074 Global"},
     };
     for (const auto& row : rows)
     {
@@ -224,11 +217,11 @@ TEST(TKCHBStream, ThrowsWithTheNumberOfKeywords)
         std::string bytes;
         const char* text;
     } rows[] = {
-        {"the first keyword", Patched(plain, 0,                  "[FOOTER]"),                  "At Line: 1"},
-        {"a frame's keyword",                   Patched(plain,              kFirstFrame - 5, "Flame"), "At Line: 10"},
-        {"a frame's number",      Patched(plain,                   kFirstFrame,                    Bytes(1)),                              "At Line: 10"},
-        {"a version",          Patched(plain,          kIntOffsets[0],         Bytes(722)),""},
-        {"a file that is cut",     plain.substr(0,plain.size() - 1),      ""                                    },
+        {"the first keyword", Patched(plain, 0, "[FOOTER]"), "At Line: 1"},
+        {"a frame's keyword", Patched(plain, kFirstFrame - 5, "Flame"), "At Line: 10"},
+        {"a frame's number", Patched(plain, kFirstFrame, Bytes(1)), "At Line: 10"},
+        {"a version", Patched(plain, kIntOffsets[0], Bytes(722)), ""},
+        {"a file that is cut", plain.substr(0, plain.size() - 1), ""},
     };
     for (const auto& row : rows)
     {

@@ -14,28 +14,19 @@ constexpr float kLower = 37.0f;
 constexpr const char* kSides[] = {"L", "R"};
 
 constexpr MadeBone kBones[] = {
-    {"Hips",   "",       {0.0f, 88.0f, 0.0f}  },
-    {"LHip",   "Hips",   {9.0f, -4.0f, 0.0f}  },
-    {"LKnee",  "LHip",   {0.0f, -kUpper, 0.0f}},
-    {"LAnkle", "LKnee",  {0.0f, -kLower, 0.0f}},
-    {"LBall",  "LAnkle", {0.0f, -6.0f, 14.0f} },
-    {"RHip",   "Hips",   {-9.0f, -4.0f, 0.0f} },
-    {"RKnee",  "RHip",   {0.0f, -kUpper, 0.0f}},
-    {"RAnkle", "RKnee",  {0.0f, -kLower, 0.0f}},
-    {"RBall",  "RAnkle", {0.0f, -6.0f, 14.0f} },
+    {"Hips", "", {0.0f, 88.0f, 0.0f}},         {"LHip", "Hips", {9.0f, -4.0f, 0.0f}},
+    {"LKnee", "LHip", {0.0f, -kUpper, 0.0f}},  {"LAnkle", "LKnee", {0.0f, -kLower, 0.0f}},
+    {"LBall", "LAnkle", {0.0f, -6.0f, 14.0f}}, {"RHip", "Hips", {-9.0f, -4.0f, 0.0f}},
+    {"RKnee", "RHip", {0.0f, -kUpper, 0.0f}},  {"RAnkle", "RKnee", {0.0f, -kLower, 0.0f}},
+    {"RBall", "RAnkle", {0.0f, -6.0f, 14.0f}},
 };
 constexpr MadeBone kTargetLegs[] = {
-    {"LowerTorso",           "",           {0.0f, 923.0f, 13.0f} },
-    {"LPelvis",              "LowerTorso", kVec3Zero,              180.0},
-    {"LThigh",                      "LPelvis",                           {-95.0f, 138.0f, 0.0f}                  },
-    {"LCalf",                      "LThigh",                            {0.0f, 360.0f, 0.0f}  },
-    {"LFoot",                      "LCalf",                            {0.0f, 345.0f, 0.0f}                   },
-    {"LToe",                      "LFoot",                             {0.0f, 62.0f, 130.0f}   },
-    {"RPelvis",                      "LowerTorso",                          kVec3Zero,            180.0},
-    {"RThigh",                 "RPelvis",                             {95.0f, 138.0f, 0.0f}                                },
-    {"RCalf", "RThigh",{0.0f, 360.0f, 0.0f}},
-    {"RFoot",  "RCalf",                              {0.0f, 345.0f, 0.0f}                                                                             },
-    {"RToe",  "RFoot",{0.0f, 62.0f, 130.0f}},
+    {"LowerTorso", "", {0.0f, 923.0f, 13.0f}},     {"LPelvis", "LowerTorso", kVec3Zero, 180.0},
+    {"LThigh", "LPelvis", {-95.0f, 138.0f, 0.0f}}, {"LCalf", "LThigh", {0.0f, 360.0f, 0.0f}},
+    {"LFoot", "LCalf", {0.0f, 345.0f, 0.0f}},      {"LToe", "LFoot", {0.0f, 62.0f, 130.0f}},
+    {"RPelvis", "LowerTorso", kVec3Zero, 180.0},   {"RThigh", "RPelvis", {95.0f, 138.0f, 0.0f}},
+    {"RCalf", "RThigh", {0.0f, 360.0f, 0.0f}},     {"RFoot", "RCalf", {0.0f, 345.0f, 0.0f}},
+    {"RToe", "RFoot", {0.0f, 62.0f, 130.0f}},
 };
 
 // A bone that points down along a direction and turns about the knee's hinge.
@@ -137,12 +128,8 @@ void PairWalker(CRetargeter& retargeter, const CWalker& walker, CNode& target)
     for (const std::string side : kSides)
     {
         retargeter.SetFixed(FindNode(&target, (side + "Pelvis").c_str()), true);
-        for (const auto& [bone, source] : {
-                 std::pair{"Thigh", "Hip"  },
-                 {"Calf",  "Knee" },
-                 {"Foot",  "Ankle"},
-                 {"Toe",   "Ball" }
-        })
+        for (const auto& [bone, source] :
+             {std::pair{"Thigh", "Hip"}, {"Calf", "Knee"}, {"Foot", "Ankle"}, {"Toe", "Ball"}})
         {
             CNode* const node = FindNode(&target, (side + bone).c_str());
             retargeter.SetSourceOf(node, &walker.Bone(side + source));

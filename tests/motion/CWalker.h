@@ -20,10 +20,7 @@ public:
     struct Pose
     {
         Vec3 hips{0.0f, 84.0f, 0.0f}; ///< the middle of the hip joints
-        std::array<Vec3, 2> ankles{
-            Vec3{9.0f,  8.0f, 0.0f},
-            Vec3{-9.0f, 8.0f, 0.0f}
-        };
+        std::array<Vec3, 2> ankles{Vec3{9.0f, 8.0f, 0.0f}, Vec3{-9.0f, 8.0f, 0.0f}};
         std::array<float, 2> footDegrees{0.0f, 0.0f}; ///< toes down
         float lean = 0.0f;                            ///< degrees of the pelvis about x, forward
         float kneesOut = 0.0f;                        ///< degrees of the knees' plane, outward

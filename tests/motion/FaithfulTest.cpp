@@ -230,9 +230,9 @@ TEST_F(Faithful, OddSourcesGiveFiniteKeys)
         float place; // of all joints, in x
         float jump;  // of the root in the last frame, in z
     } rows[] = {
-        {"one frame",                 1,  76.0f, 0.0f, 0.0f   },
-        {"an ankle at its hip",       20, 2.5f,  0.0f, 0.0f   },
-        {"far away",                  20, 76.0f, 1e7f, 0.0f   },
+        {"one frame", 1, 76.0f, 0.0f, 0.0f},
+        {"an ankle at its hip", 20, 2.5f, 0.0f, 0.0f},
+        {"far away", 20, 76.0f, 1e7f, 0.0f},
         {"at the end of the numbers", 20, 76.0f, 0.0f, 3.4e38f},
     };
     for (const auto& row : rows)

@@ -74,17 +74,17 @@ TEST(TKHTRStream, RowsAreDeltasThatActBeforeTheBase)
 TEST(TKHTRStream, ReadsTheSameMotionWhateverMeansNothing)
 {
     const Change rows[] = {
-        {"CR LF and a byte order mark", "",                   "\xef\xbb\xbf" + WithCarriageReturns(kSmallHTR)},
-        {"blank lines in sections",     "1 0 0 0 0 0 0 1\n2", "\n1 0 0 0 0 0 0 1\n \t\n2"                    },
-        {"comments",                    "Torso 0 100",        "#Torso 1 1 1\nTorso 0 100"                    },
-        {"blank line in the header",    "DataType",           "\nDataType"                                   },
-        {"frames in any order",         "2 0 0 0 -5",         "-7 0 0 0 -5"                                  },
-        {"commas and tabs",             "2 0 0 0 -5 15 25",   "2,0, 0\t0,-5 , 15,25"                         },
-        {"unknown key",                 "NumFrames",          "Colour red\nNumFrames"                        },
-        {"unknown section",             "[Torso]",            "[EndOfFile]\n1 2 3\n[Torso]"                  },
-        {"more segments than lines",    "NumSegments 2",      "NumSegments 99"                               },
-        {"longer words than fit",       "Order ZYX",          "Order ZYXr"                                   },
-        {"surplus row",                 "-5 15 25 1\n",       "-5 15 25 1\n3 9 9 9 9 9 9 9\n"                },
+        {"CR LF and a byte order mark", "", "\xef\xbb\xbf" + WithCarriageReturns(kSmallHTR)},
+        {"blank lines in sections", "1 0 0 0 0 0 0 1\n2", "\n1 0 0 0 0 0 0 1\n \t\n2"},
+        {"comments", "Torso 0 100", "#Torso 1 1 1\nTorso 0 100"},
+        {"blank line in the header", "DataType", "\nDataType"},
+        {"frames in any order", "2 0 0 0 -5", "-7 0 0 0 -5"},
+        {"commas and tabs", "2 0 0 0 -5 15 25", "2,0, 0\t0,-5 , 15,25"},
+        {"unknown key", "NumFrames", "Colour red\nNumFrames"},
+        {"unknown section", "[Torso]", "[EndOfFile]\n1 2 3\n[Torso]"},
+        {"more segments than lines", "NumSegments 2", "NumSegments 99"},
+        {"longer words than fit", "Order ZYX", "Order ZYXr"},
+        {"surplus row", "-5 15 25 1\n", "-5 15 25 1\n3 9 9 9 9 9 9 9\n"},
     };
     CLoadedMotion plain(kSmallHTR, "a.htr");
     const Mat4 expected = PosedNode(plain.motion, "Head", 1).m_kWorldMatrix;
@@ -110,22 +110,24 @@ TEST(TKHTRStream, ReadsOddFilesAsTheyStand)
         size_t headKeys;
         std::string record;
     } rows[] = {
-        {{"a segment not counted", "ments 2", "ments 1"},     "Torso",       0, "BadCount 17 NumSegments\n*" },
-        {{"unknown parent", "Head Torso", "Head Body"},       "Torso",       0, "UnknownSegment 17 Body\n*"  },
-        {{"two roots", "Head Torso", "Head GLOBAL"},          "Torso",       0, ""                           },
+        {{"a segment not counted", "ments 2", "ments 1"}, "Torso", 0, "BadCount 17 NumSegments\n*"},
+        {{"unknown parent", "Head Torso", "Head Body"}, "Torso", 0, "UnknownSegment 17 Body\n*"},
+        {{"two roots", "Head Torso", "Head GLOBAL"}, "Torso", 0, ""},
         {{"section without an end", "[Head]", "[Head"},
-         "Torso(Head)",                                                      0,
-         "UnknownSegment 27 [Head\n" + noRows                                                                },
-        {{"a row is missing", "2 0 0 0 -5 15 25 1\n", ""},    "Torso(Head)", 1, "TooFewRows 17 Head\n"       },
-        {{"a row is short", "-5 15 25 1", "-5"},              "Torso(Head)", 2, "ShortRow 30 Head\n"         },
-        {{"a row without values", "2 0 0 0 -5 15 25 1", "2"}, "Torso(Head)", 2, "ShortRow 30 Head\n"         },
+         "Torso(Head)",
+         0,
+         "UnknownSegment 27 [Head\n" + noRows},
+        {{"a row is missing", "2 0 0 0 -5 15 25 1\n", ""}, "Torso(Head)", 1, "TooFewRows 17 Head\n"},
+        {{"a row is short", "-5 15 25 1", "-5"}, "Torso(Head)", 2, "ShortRow 30 Head\n"},
+        {{"a row without values", "2 0 0 0 -5 15 25 1", "2"}, "Torso(Head)", 2, "ShortRow 30 Head\n"},
         {{"key without value", "Factor 1.000000", "Factor"},
-         "Torso(Head)",                                                      2,
-         "MissingTokens 13 ScaleFactor\n"                                                                    },
-        {{"used key without value", "mes 2", "mes"},          "Torso(Head)", 2, "MissingTokens 6 NumFrames\n"},
-        {{"two numbers in one", "2 0 0 0 -5", "2 0 0 0-5"},   "Torso(Head)", 2, "StuckNumber 30 0-5\n"       },
-        {{"two sections", "[Head]", "[Head]\n1 2\n[Head]"},   "Torso(Head)", 3, "ShortRow 28 Head\n"         },
-        {{"fewer frames than none", "Frames 2", "Frames -2"}, "Torso(Head)", 2, ""                           },
+         "Torso(Head)",
+         2,
+         "MissingTokens 13 ScaleFactor\n"},
+        {{"used key without value", "mes 2", "mes"}, "Torso(Head)", 2, "MissingTokens 6 NumFrames\n"},
+        {{"two numbers in one", "2 0 0 0 -5", "2 0 0 0-5"}, "Torso(Head)", 2, "StuckNumber 30 0-5\n"},
+        {{"two sections", "[Head]", "[Head]\n1 2\n[Head]"}, "Torso(Head)", 3, "ShortRow 28 Head\n"},
+        {{"fewer frames than none", "Frames 2", "Frames -2"}, "Torso(Head)", 2, ""},
     };
     for (const auto& row : rows)
     {
@@ -167,12 +169,7 @@ TEST(TKHTRStream, RowsWithoutValuesRepeatTheRowAbove)
     const CLoadedMotion file(Changed({"", "1 1 2 3 0 0 0 1\n", "1\n1 1 2 3 0 0 0 1\n2\n"}), "a.htr");
     ASSERT_TRUE(file.loaded);
     const CKeyframeControl& torso = TrackOf(file.motion, "Torso");
-    EXPECT_EQ(torso.m_kPositionKeys, (std::vector<Vec3>{
-                                         {0, 100, 0},
-                                         {1, 102, 3},
-                                         {1, 102, 3},
-                                         {4, 105, 6}
-    }));
+    EXPECT_EQ(torso.m_kPositionKeys, (std::vector<Vec3>{{0, 100, 0}, {1, 102, 3}, {1, 102, 3}, {4, 105, 6}}));
     EXPECT_EQ(torso.m_kScaleKeys[0], kVec3One);
 }
 
@@ -183,21 +180,21 @@ TEST(TKHTRStream, RefusesWithReasonAndLine)
         Change change;
         const char* record;
     } rows[] = {
-        {{"no bytes", "", ""},                                    "MissingSection 0 [SegmentNames&Hierarchy]"},
-        {{"other text", "", "HIERARCHY\n"},                       "MissingSection 1 [SegmentNames&Hierarchy]"},
-        {{"no segments counted", "ments 2", "ments 0"},           "NoRoot 30 NumSegments"                    },
-        {{"count of segments missing", "NumSegments 2\n", ""},    "NoRoot 29 NumSegments"                    },
-        {{"a ring", "Torso GLOBAL", "Torso Head"},                "UnknownSegment 23 Torso"                  },
-        {{"a ring of one", "Torso GLOBAL", "Torso Torso"},        "UnknownSegment 23 Torso"                  },
-        {{"absurdly many frames", "mes 2", "mes 2000000000"},     "BadCount 6 NumFrames"                     },
-        {{"frames beyond 32 bits", "mes 2", "mes 99999999999"},   "BadCount 6 NumFrames"                     },
-        {{"word as count", "Frames 2", "Frames two"},             "BadNumber 6 two"                          },
-        {{"endless scale factor", "1.000000", "inf"},             "BadNumber 13 inf"                         },
-        {{"word in the base pose", "Head 0 50", "Head 0 high"},   "BadNumber 21 high"                        },
-        {{"word in a row", "2 4 5 6", "2 4 x 6"},                 "BadNumber 26 x"                           },
-        {{"not a number in a row", "2 4 5 6", "2 4 nan 6"},       "BadNumber 26 nan"                         },
-        {{"number too big for a float", "2 4 5 6", "2 4 1e39 6"}, "BadNumber 26 1e39"                        },
-        {{"row that is no row", "2 4 5 6", "Torso 4 5 6"},        "BadNumber 26 Torso"                       },
+        {{"no bytes", "", ""}, "MissingSection 0 [SegmentNames&Hierarchy]"},
+        {{"other text", "", "HIERARCHY\n"}, "MissingSection 1 [SegmentNames&Hierarchy]"},
+        {{"no segments counted", "ments 2", "ments 0"}, "NoRoot 30 NumSegments"},
+        {{"count of segments missing", "NumSegments 2\n", ""}, "NoRoot 29 NumSegments"},
+        {{"a ring", "Torso GLOBAL", "Torso Head"}, "UnknownSegment 23 Torso"},
+        {{"a ring of one", "Torso GLOBAL", "Torso Torso"}, "UnknownSegment 23 Torso"},
+        {{"absurdly many frames", "mes 2", "mes 2000000000"}, "BadCount 6 NumFrames"},
+        {{"frames beyond 32 bits", "mes 2", "mes 99999999999"}, "BadCount 6 NumFrames"},
+        {{"word as count", "Frames 2", "Frames two"}, "BadNumber 6 two"},
+        {{"endless scale factor", "1.000000", "inf"}, "BadNumber 13 inf"},
+        {{"word in the base pose", "Head 0 50", "Head 0 high"}, "BadNumber 21 high"},
+        {{"word in a row", "2 4 5 6", "2 4 x 6"}, "BadNumber 26 x"},
+        {{"not a number in a row", "2 4 5 6", "2 4 nan 6"}, "BadNumber 26 nan"},
+        {{"number too big for a float", "2 4 5 6", "2 4 1e39 6"}, "BadNumber 26 1e39"},
+        {{"row that is no row", "2 4 5 6", "Torso 4 5 6"}, "BadNumber 26 Torso"},
     };
     for (const auto& row : rows)
     {
@@ -298,11 +295,11 @@ TEST(TKHTRStream, WritesTheseBytes)
         std::string torso;
         std::string head;
     } rows[] = {
-        {"as it is",      1.0f,  "2",  rowsOf({begin, end}),              rowsOf({still, still})              },
-        {"twice",         2.0f,  "4",  rowsOf({begin, middle, end, end}), rowsOf({still, still, still, still})},
-        {"half",          0.5f,  "1",  rowsOf({begin}),                   rowsOf({still})                     },
-        {"nothing",       0.0f,  "0",  "",                                ""                                  },
-        {"below nothing", -1.0f, "-2", "",                                ""                                  },
+        {"as it is", 1.0f, "2", rowsOf({begin, end}), rowsOf({still, still})},
+        {"twice", 2.0f, "4", rowsOf({begin, middle, end, end}), rowsOf({still, still, still, still})},
+        {"half", 0.5f, "1", rowsOf({begin}), rowsOf({still})},
+        {"nothing", 0.0f, "0", "", ""},
+        {"below nothing", -1.0f, "-2", "", ""},
     };
     CLoadedMotion file(kMoving, "a.htr");
     ASSERT_TRUE(file.loaded);

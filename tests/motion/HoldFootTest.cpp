@@ -31,9 +31,7 @@ std::vector<FootHold> Hold(const std::vector<Vec3>& path, const std::vector<Cont
 
 TEST(HoldFoot, HoldsInTheMiddleAndFadesAtTheEnds)
 {
-    const std::vector<FootHold> holds = Hold(Drift(60, 0.5f), {
-                                                                  {20, 40}
-    });
+    const std::vector<FootHold> holds = Hold(Drift(60, 0.5f), {{20, 40}});
     for (int frame = 23; frame < 37; ++frame)
     {
         EXPECT_EQ(holds[static_cast<size_t>(frame)].share, 1.0f) << frame;
@@ -47,17 +45,13 @@ TEST(HoldFoot, HoldsInTheMiddleAndFadesAtTheEnds)
 
 TEST(HoldFoot, MotionThatBeginsAndEndsInAContactIsHeldThroughout)
 {
-    for (const FootHold& hold : Hold(Drift(30, 0.2f), {
-                                                          {0, 30}
-    }))
+    for (const FootHold& hold : Hold(Drift(30, 0.2f), {{0, 30}}))
         EXPECT_EQ(hold.share, 1.0f);
 }
 
 TEST(HoldFoot, FootThatIsDraggedIsLedWithSomePlay)
 {
-    const std::vector<FootHold> holds = Hold(Drift(101, 1.0f), {
-                                                                   {0, 101}
-    });
+    const std::vector<FootHold> holds = Hold(Drift(101, 1.0f), {{0, 101}});
     EXPECT_NEAR(holds[50].place.z, 50.0f, 0.1f);
     EXPECT_NEAR(holds[64].place.z, 50.0f, 0.1f) << "within the play";
     EXPECT_NEAR(holds[100].place.z, 100.0f - kPlay, 0.1f);
@@ -71,10 +65,7 @@ TEST(HoldFoot, ContactsWithAGapKeepTheirPlaces)
         SCOPED_TRACE(gap);
         std::vector<Vec3> path(41, Vec3{0.0f, 80.0f, 0.0f});
         std::fill(path.begin() + 20, path.end(), Vec3{0.0f, 80.0f, 8.0f});
-        const std::vector<FootHold> holds = Hold(path, {
-                                                           {0,        20},
-                                                           {20 + gap, 41}
-        });
+        const std::vector<FootHold> holds = Hold(path, {{0, 20}, {20 + gap, 41}});
         EXPECT_NEAR(holds[19].place.z, 0.0f, 0.01f);
         EXPECT_NEAR(holds[static_cast<size_t>(20 + gap)].place.z, 8.0f, 0.01f);
         EXPECT_GT(holds[19].share, 0.0f);
@@ -110,10 +101,8 @@ TEST(YieldKnee, BentKneeReachesWhatIsAskedAndAStraightOneKeepsItsAngle)
         double reached; // of that, at the least
         double turned;  // degrees that the knee may turn
     } rows[] = {
-        {"bent, shorter",    60.0, -20.0, -19.0, 10.0},
-        {"bent, longer",     60.0, 20.0,  18.5,  10.0},
-        {"straight, noise",  2.0,  -0.3,  0.0,   1.0 },
-        {"straight, longer", 2.0,  30.0,  0.0,   2.1 },
+        {"bent, shorter", 60.0, -20.0, -19.0, 10.0},    {"bent, longer", 60.0, 20.0, 18.5, 10.0},
+        {"straight, noise", 2.0, -0.3, 0.0, 1.0},       {"straight, longer", 2.0, 30.0, 0.0, 2.1},
         {"out of all reach", 90.0, 900.0, 150.0, 90.0},
     };
     for (const auto& row : rows)

@@ -93,12 +93,12 @@ TEST(CLegSolver, GoalsAtTheLimits)
         bool ok;
         double reach; // how far from the hip the ankle comes to stand
     } rows[] = {
-        {"far out of reach is drawn in to just short of straight", {0, 0, -2000}, true,  full / 1.00001},
-        {"exactly at the full length",                             {0, 0, -full}, true,  full          },
-        {"exactly at the full length, sideways",                   {full, 0, 0},  true,  full          },
-        {"straight along the hinge's axis",                        {0, 0, 500},   true,  500           },
-        {"nearer than the segments can fold",                      {0, 0, -10},   false, 0             },
-        {"at the hip itself",                                      {0, 0, 0},     false, 0             },
+        {"far out of reach is drawn in to just short of straight", {0, 0, -2000}, true, full / 1.00001},
+        {"exactly at the full length", {0, 0, -full}, true, full},
+        {"exactly at the full length, sideways", {full, 0, 0}, true, full},
+        {"straight along the hinge's axis", {0, 0, 500}, true, 500},
+        {"nearer than the segments can fold", {0, 0, -10}, false, 0},
+        {"at the hip itself", {0, 0, 0}, false, 0},
     };
     for (const auto& row : rows)
     {

@@ -20,17 +20,17 @@ TEST(CMotionFile, ChoosesByTheExtension)
         std::string_view text;
         const char* tree;
     } rows[] = {
-        {"a.bvh",     kSmallBVH, "Hips(Chest)"},
-        {"a.Bvh",     kSmallBVH, "Hips(Chest)"},
-        {"a.BVH",     kSmallBVH, "Hips(Chest)"},
+        {"a.bvh", kSmallBVH, "Hips(Chest)"},
+        {"a.Bvh", kSmallBVH, "Hips(Chest)"},
+        {"a.BVH", kSmallBVH, "Hips(Chest)"},
         {"a.bvh.htr", kSmallHTR, "Torso(Head)"},
-        {".htr",      kSmallHTR, "Torso(Head)"},
-        {"a.htr.bvh", kSmallHTR, ""           },
-        {"a.cha",     kSmallCHA, "Torso(Head)"},
-        {"a.CHA",     kSmallCHA, "Torso(Head)"},
-        {"a.chb",     kSmallCHA, ""           },
-        {"a.txt",     kSmallBVH, ""           },
-        {"bvh",       kSmallBVH, ""           },
+        {".htr", kSmallHTR, "Torso(Head)"},
+        {"a.htr.bvh", kSmallHTR, ""},
+        {"a.cha", kSmallCHA, "Torso(Head)"},
+        {"a.CHA", kSmallCHA, "Torso(Head)"},
+        {"a.chb", kSmallCHA, ""},
+        {"a.txt", kSmallBVH, ""},
+        {"bvh", kSmallBVH, ""},
     };
     for (const auto& row : rows)
     {
@@ -57,11 +57,11 @@ TEST(CMotionFile, KeepsItsTreesWhenALoadFails)
         bool loaded;
         const char* record;
     } rows[] = {
-        {"",                            false, "failed NotFound 0 \n"                              },
-        {file.folder.Path("none.bvh"),  false, "failed NotFound 0 \n"                              },
-        {file.folder.Path("bad.htr"),   false, "failed MissingSection 1 [SegmentNames&Hierarchy]\n"},
-        {file.folder.Path("other.txt"), true,  ""                                                  },
-        {file.folder.Path("none.txt"),  true,  ""                                                  },
+        {"", false, "failed NotFound 0 \n"},
+        {file.folder.Path("none.bvh"), false, "failed NotFound 0 \n"},
+        {file.folder.Path("bad.htr"), false, "failed MissingSection 1 [SegmentNames&Hierarchy]\n"},
+        {file.folder.Path("other.txt"), true, ""},
+        {file.folder.Path("none.txt"), true, ""},
     };
     for (const auto& row : rows)
     {
@@ -91,12 +91,12 @@ TEST(CMotionFile, WritesNothingItCannotWriteWhole)
         float frameScale;
         const char* record;
     } rows[] = {
-        {htr.motion,  "b.bvh",      1.0f,                                    "failed UnknownFormat 0 \n"},
-        {htr.motion,  "b",          1.0f,                                    "failed UnknownFormat 0 \n"},
-        {htr.motion,  "none/b.htr", 1.0f,                                    "failed WriteError 0 \n"   },
-        {htr.motion,  "b.htr",      1e30f,                                   "failed TooLarge 0 \n"     },
-        {htr.motion,  "b.htr",      std::numeric_limits<float>::quiet_NaN(), "failed TooLarge 0 \n"     },
-        {withoutRest, "b.htr",      1.0f,                                    "failed NoRoot 0 \n"       },
+        {htr.motion, "b.bvh", 1.0f, "failed UnknownFormat 0 \n"},
+        {htr.motion, "b", 1.0f, "failed UnknownFormat 0 \n"},
+        {htr.motion, "none/b.htr", 1.0f, "failed WriteError 0 \n"},
+        {htr.motion, "b.htr", 1e30f, "failed TooLarge 0 \n"},
+        {htr.motion, "b.htr", std::numeric_limits<float>::quiet_NaN(), "failed TooLarge 0 \n"},
+        {withoutRest, "b.htr", 1.0f, "failed NoRoot 0 \n"},
     };
     for (const auto& row : rows)
     {
@@ -134,13 +134,10 @@ TEST(CMotionFile, NamesWhatIsNoTPose)
         const char* right;
         bool warns;
     } rows[] = {
-        {"both sideways",         "5 0 0",  "-5 0 0",  false},
-        {"a little down",         "5 0 -2", "-5 0 -2", false},
-        {"half way down",         "5 0 -5", "-5 0 -5", true },
-        {"hanging",               "0 0 -5", "0 0 -5",  true },
-        {"one of them hanging",   "5 0 0",  "0 0 -5",  true },
-        {"crossed",               "-5 0 0", "5 0 0",   true },
-        {"arms without a length", "0 0 0",  "0 0 0",   false},
+        {"both sideways", "5 0 0", "-5 0 0", false},        {"a little down", "5 0 -2", "-5 0 -2", false},
+        {"half way down", "5 0 -5", "-5 0 -5", true},       {"hanging", "0 0 -5", "0 0 -5", true},
+        {"one of them hanging", "5 0 0", "0 0 -5", true},   {"crossed", "-5 0 0", "5 0 0", true},
+        {"arms without a length", "0 0 0", "0 0 0", false},
     };
     for (const auto& row : rows)
     {

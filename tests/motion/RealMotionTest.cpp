@@ -79,14 +79,9 @@ TEST(RealMotions, OfMatricesStandAsAnIndependentReadingHasThem)
         const char* extension;
         int frame;
     } rows[] = {
-        {"plain-text",   ".cha", 20},
-        {"remarks",      ".cha", 18},
-        {"short-row",    ".cha", 16},
-        {"open-header",  ".cha", 5 },
-        {"plain-binary", ".chb", 13},
-        {"begin",        ".chb", 6 },
-        {"roots",        ".chb", 13},
-        {"hundred",      ".chb", 4 },
+        {"plain-text", ".cha", 20}, {"remarks", ".cha", 18},      {"short-row", ".cha", 16},
+        {"open-header", ".cha", 5}, {"plain-binary", ".chb", 13}, {"begin", ".chb", 6},
+        {"roots", ".chb", 13},      {"hundred", ".chb", 4},
     };
     for (const auto& row : rows)
     {

@@ -28,41 +28,41 @@ constexpr Vec3 kRootPosition{0, 923, 13};
 
 // A target of the fixed skeleton's make: legs below pelvis bones that are turned by half a turn.
 constexpr MadeBone kTarget[] = {
-    {"LowerTorso",   "",           kRootPosition          },
-    {"Waist",        "LowerTorso", {0, 95, 0}             },
-    {"UpperTorso",   "Waist",      {0, 150, 0}            },
-    {"Neck",         "UpperTorso", {0, 265, 0}            },
-    {"LCollar",      "UpperTorso", {25, 215, 0},            -90},
-    {"LUpperArm",              "LCollar",                {0, 145, 0}                },
-    {"LForearm",              "LUpperArm",                 {0, 285, 0}},
-    {"LHand",              "LForearm",                    {0, 255, 0}                    },
-    {"LPelvis",              "LowerTorso",                  {0, 0, 0},180},
-    {"LThigh",           "LPelvis",                       {-95, 138, 0}                                           },
-    {"LCalf", "LThigh",{0, 360, 0}},
-    {"LFoot",   "LCalf",                         {0, 345, 0}                                                                             },
-    {"RPelvis",   "LowerTorso",{0, 0, 0},180},
-    {"RThigh",     "RPelvis",                        {95, 138, 0}                                                                                                                      },
-    {"RCalf", "RThigh",{0, 360, 0}},
-    {"RFoot",      "RCalf",                              {0, 345, 0}                                                                                                                                                                          },
+    {"LowerTorso", "", kRootPosition},
+    {"Waist", "LowerTorso", {0, 95, 0}},
+    {"UpperTorso", "Waist", {0, 150, 0}},
+    {"Neck", "UpperTorso", {0, 265, 0}},
+    {"LCollar", "UpperTorso", {25, 215, 0}, -90},
+    {"LUpperArm", "LCollar", {0, 145, 0}},
+    {"LForearm", "LUpperArm", {0, 285, 0}},
+    {"LHand", "LForearm", {0, 255, 0}},
+    {"LPelvis", "LowerTorso", {0, 0, 0}, 180},
+    {"LThigh", "LPelvis", {-95, 138, 0}},
+    {"LCalf", "LThigh", {0, 360, 0}},
+    {"LFoot", "LCalf", {0, 345, 0}},
+    {"RPelvis", "LowerTorso", {0, 0, 0}, 180},
+    {"RThigh", "RPelvis", {95, 138, 0}},
+    {"RCalf", "RThigh", {0, 360, 0}},
+    {"RFoot", "RCalf", {0, 345, 0}},
 };
 
 // A source of other proportions and units, every joint's axes along the world's at rest.
 constexpr MadeBone kSource[] = {
-    {"Hips",       "",           {0, 92, 0} },
-    {"Spine",      "Hips",       {0, 12, 0} },
-    {"Spine1",     "Spine",      {0, 11, 0} },
-    {"Chest",      "Spine1",     {0, 14, 0} },
-    {"Neck",       "Chest",      {0, 26, 1} },
-    {"LeftCollar", "Chest",      {3, 22, 0} },
-    {"LeftArm",    "LeftCollar", {14, 0, 0} },
-    {"LeftElbow",  "LeftArm",    {28, 0, 0} },
-    {"LeftWrist",  "LeftElbow",  {25, 0, 0} },
-    {"LeftHip",    "Hips",       {9, -4, 0} },
-    {"LeftKnee",   "LeftHip",    {0, -43, 0}},
-    {"LeftAnkle",  "LeftKnee",   {0, -40, 0}},
-    {"RightHip",   "Hips",       {-9, -4, 0}},
-    {"RightKnee",  "RightHip",   {0, -43, 0}},
-    {"RightAnkle", "RightKnee",  {0, -40, 0}},
+    {"Hips", "", {0, 92, 0}},
+    {"Spine", "Hips", {0, 12, 0}},
+    {"Spine1", "Spine", {0, 11, 0}},
+    {"Chest", "Spine1", {0, 14, 0}},
+    {"Neck", "Chest", {0, 26, 1}},
+    {"LeftCollar", "Chest", {3, 22, 0}},
+    {"LeftArm", "LeftCollar", {14, 0, 0}},
+    {"LeftElbow", "LeftArm", {28, 0, 0}},
+    {"LeftWrist", "LeftElbow", {25, 0, 0}},
+    {"LeftHip", "Hips", {9, -4, 0}},
+    {"LeftKnee", "LeftHip", {0, -43, 0}},
+    {"LeftAnkle", "LeftKnee", {0, -40, 0}},
+    {"RightHip", "Hips", {-9, -4, 0}},
+    {"RightKnee", "RightHip", {0, -43, 0}},
+    {"RightAnkle", "RightKnee", {0, -40, 0}},
 };
 
 Ref<CNode> MakeTarget()
@@ -93,20 +93,11 @@ Ref<CNode> MakeSource(int frameCount)
 }
 
 const std::pair<const char*, const char*> kMap[] = {
-  // source and target
-    {"Hips",       "LowerTorso"},
-    {"Chest",      "UpperTorso"},
-    {"Neck",       "Neck"      },
-    {"LeftCollar", "LCollar"   },
-    {"LeftArm",    "LUpperArm" },
-    {"LeftElbow",  "LForearm"  },
-    {"LeftWrist",  "LHand"     },
-    {"LeftHip",    "LThigh"    },
-    {"RightHip",   "RThigh"    },
-    {"LeftKnee",   "LCalf"     },
-    {"RightKnee",  "RCalf"     },
-    {"LeftAnkle",  "LFoot"     },
-    {"RightAnkle", "RFoot"     },
+    // source and target
+    {"Hips", "LowerTorso"},   {"Chest", "UpperTorso"},   {"Neck", "Neck"},       {"LeftCollar", "LCollar"},
+    {"LeftArm", "LUpperArm"}, {"LeftElbow", "LForearm"}, {"LeftWrist", "LHand"}, {"LeftHip", "LThigh"},
+    {"RightHip", "RThigh"},   {"LeftKnee", "LCalf"},     {"RightKnee", "RCalf"}, {"LeftAnkle", "LFoot"},
+    {"RightAnkle", "RFoot"},
 };
 
 double DegreesBetween(const Mat4& a, const Mat3& b)
@@ -154,9 +145,7 @@ protected:
 TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
 {
     const Vec3 angles{12, -30, 45};
-    const Mat3 codes{
-        {-1, 0, 0, 0, 0, 1, 0, 1, 0}
-    };
+    const Mat3 codes{{-1, 0, 0, 0, 0, 1, 0, 1, 0}};
     m_kRetargeter.SetOffsetAngles(Target("LForearm"), angles);
     m_kRetargeter.SetOffsetMatrix(Target("LForearm"), codes);
     m_kRetargeter.SetOffsetAngles(Target("Neck"), {0, 90, 0});
@@ -172,16 +161,11 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
         const char* target;
         const Mat3* offset; // stands left of the source's rotation: it acts first
     } rows[] = {
-        {"Hips",       "LowerTorso", &none   },
-        {"LeftHip",    "LThigh",     &none   },
-        {"RightKnee",  "RCalf",      &none   },
-        {"LeftAnkle",  "LFoot",      &none   },
-        {"Chest",      "UpperTorso", &none   },
-        {"LeftCollar", "LCollar",    &none   },
-        {"LeftArm",    "LUpperArm",  &none   },
-        {"LeftElbow",  "LForearm",   &forearm},
-        {"LeftWrist",  "LHand",      &none   },
-        {"Neck",       "Neck",       &neck   },
+        {"Hips", "LowerTorso", &none},   {"LeftHip", "LThigh", &none},
+        {"RightKnee", "RCalf", &none},   {"LeftAnkle", "LFoot", &none},
+        {"Chest", "UpperTorso", &none},  {"LeftCollar", "LCollar", &none},
+        {"LeftArm", "LUpperArm", &none}, {"LeftElbow", "LForearm", &forearm},
+        {"LeftWrist", "LHand", &none},   {"Neck", "Neck", &neck},
     };
     for (size_t frame = 0; frame < 10; ++frame)
     {
@@ -201,12 +185,8 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
 TEST_F(CRetargeterTest, SharesAreInProportionToTheirWeights)
 {
     const std::tuple<CBoneShares, Vec3, double> rows[] = {
-        {{1, 1, 1}, {40, 0, 0}, 20.0  },
-        {{3, 1, 1}, {40, 0, 0}, 30.868},
-        {{1, 3, 1}, {40, 0, 0}, 20.0  },
-        {{0, 0, 1}, {40, 0, 0}, 0.0   },
-        {{1, 1, 1}, {0, 40, 0}, 23.681},
-        {{3, 1, 1}, {0, 40, 0}, 22.197},
+        {{1, 1, 1}, {40, 0, 0}, 20.0},   {{3, 1, 1}, {40, 0, 0}, 30.868}, {{1, 3, 1}, {40, 0, 0}, 20.0},
+        {{0, 0, 1}, {40, 0, 0}, 0.0},    {{1, 1, 1}, {0, 40, 0}, 23.681}, {{3, 1, 1}, {0, 40, 0}, 22.197},
         {{1, 3, 1}, {0, 40, 0}, 35.369},
     };
     for (CNode* node : NodesOf(*m_kSource))
@@ -281,10 +261,8 @@ TEST_F(CRetargeterTest, FeetReachTheScaledGoalsOfTheSource)
         Pose(frame);
         const Vec3 sourceHip = Source("Hips")->m_kWorldMatrix.Translation();
         const Vec3 targetHip = Target("LowerTorso")->m_kWorldMatrix.Translation();
-        for (const auto& [source, target, thigh] : {
-                 std::tuple{"LeftAnkle",  "LFoot", "LThigh"},
-                 std::tuple{"RightAnkle", "RFoot", "RThigh"}
-        })
+        for (const auto& [source, target, thigh] :
+             {std::tuple{"LeftAnkle", "LFoot", "LThigh"}, std::tuple{"RightAnkle", "RFoot", "RThigh"}})
         {
             const Vec3 goal = targetHip + (Source(source)->m_kWorldMatrix.Translation() - sourceHip) * scale;
             const Vec3 fromHip = goal - Target(thigh)->m_kWorldMatrix.Translation();
@@ -350,11 +328,9 @@ TEST_F(CRetargeterTest, TracksHaveAKeyForEveryFrameThroughTheLast)
         float last;
         size_t keys;
     } rows[] = {
-        {"ten frames",                                  9.0f,          10},
-        {"the last one counts only when it is reached", 4.5f,          5 },
-        {"one frame",                                   0.0f,          1 },
-        {"none below 0",                                -1.0f,         0 },
-        {"no number",                                   std::nanf(""), 0 },
+        {"ten frames", 9.0f, 10},        {"the last one counts only when it is reached", 4.5f, 5},
+        {"one frame", 0.0f, 1},          {"none below 0", -1.0f, 0},
+        {"no number", std::nanf(""), 0},
     };
     for (const auto& row : rows)
     {
@@ -427,15 +403,15 @@ TEST_F(CRetargeterTest, ShareFileLines)
         const char* bone; // null where none gets shares
         BoneShares shares;
     } rows[] = {
-        {"plain",                                    "Waist Share 1 2 Type 0",             "Waist",      {1, 2, 0}},
-        {"keywords without case, commas and colons", "SHARE: 3, 4, tYPE: 2, Neck",         "Neck",       {3, 4, 2}},
-        {"type stays from the line before",          "Type 2 Waist\nUpperTorso Share 1 5", "UpperTorso", {1, 5, 2}},
-        {"the last name wins",                       "Waist Neck Share 6 7 Type 1",        "Neck",       {6, 7, 1}},
-        {"a signed number is a name",                "Neck Share -1 2 Type 1",             nullptr,      {}       },
-        {"a name in another case",                   "wAIST Share 3 1 Type 2",             "Waist",      {3, 1, 2}},
-        {"a bone that is not there",                 "Tail Share 1 1 Type 1",              nullptr,      {}       },
-        {"no numbers",                               "Neck Share Type",                    nullptr,      {}       },
-        {"windows line ends",                        "Waist Share 8 9 Type 1\r\n",         "Waist",      {8, 9, 1}},
+        {"plain", "Waist Share 1 2 Type 0", "Waist", {1, 2, 0}},
+        {"keywords without case, commas and colons", "SHARE: 3, 4, tYPE: 2, Neck", "Neck", {3, 4, 2}},
+        {"type stays from the line before", "Type 2 Waist\nUpperTorso Share 1 5", "UpperTorso", {1, 5, 2}},
+        {"the last name wins", "Waist Neck Share 6 7 Type 1", "Neck", {6, 7, 1}},
+        {"a signed number is a name", "Neck Share -1 2 Type 1", nullptr, {}},
+        {"a name in another case", "wAIST Share 3 1 Type 2", "Waist", {3, 1, 2}},
+        {"a bone that is not there", "Tail Share 1 1 Type 1", nullptr, {}},
+        {"no numbers", "Neck Share Type", nullptr, {}},
+        {"windows line ends", "Waist Share 8 9 Type 1\r\n", "Waist", {8, 9, 1}},
     };
     const std::string path = ::testing::TempDir() + "shares.bsm";
     for (const auto& row : rows)

@@ -48,20 +48,21 @@ TEST(CTextLines, EndsLinesAndCutsLongOnes)
         std::string text;
         std::vector<std::string> pieces;
     } rows[] = {
-        {"no bytes",                               "",                     {}                                },
-        {"line feeds",                             "a\n\nb\n",             {"1:a", "2:", "3:b"}              },
-        {"carriage returns and line feeds, mixed", "a\r\n\r\nb\nc\r\n",    {"1:a", "2:", "3:b", "4:c"}       },
-        {"no end behind the last line",            "a\nb",                 {"1:a", "2:b"}                    },
-        {"a lone carriage return is a character",  "a\rb\n\r",             {"1:a\rb", "2:\r"}                },
+        {"no bytes", "", {}},
+        {"line feeds", "a\n\nb\n", {"1:a", "2:", "3:b"}},
+        {"carriage returns and line feeds, mixed", "a\r\n\r\nb\nc\r\n", {"1:a", "2:", "3:b", "4:c"}},
+        {"no end behind the last line", "a\nb", {"1:a", "2:b"}},
+        {"a lone carriage return is a character", "a\rb\n\r", {"1:a\rb", "2:\r"}},
         {"a byte order mark",
          "\xef\xbb\xbf"
-         "a\n",                                                            {"1:a"}                           },
-        {"just shorter than a piece",              shorter + "\nb",        {"1:4094", "2:b"}                 },
-        {"a full piece leaves its line end",       full + "\nb",           {"1:4095", "1:", "2:b"}           },
-        {"a full piece leaves both its line ends", full + "\r\nb",         {"1:4095", "1:", "2:b"}           },
-        {"a full piece ends the text",             full,                   {"1:4095"}                        },
-        {"carriage return at the cut",             full + "\ry\nb",        {"1:4095", "1:\ry", "2:b"}        },
-        {"three pieces",                           full + full + "y\r\nb", {"1:4095", "1:4095", "1:y", "2:b"}},
+         "a\n",
+         {"1:a"}},
+        {"just shorter than a piece", shorter + "\nb", {"1:4094", "2:b"}},
+        {"a full piece leaves its line end", full + "\nb", {"1:4095", "1:", "2:b"}},
+        {"a full piece leaves both its line ends", full + "\r\nb", {"1:4095", "1:", "2:b"}},
+        {"a full piece ends the text", full, {"1:4095"}},
+        {"carriage return at the cut", full + "\ry\nb", {"1:4095", "1:\ry", "2:b"}},
+        {"three pieces", full + full + "y\r\nb", {"1:4095", "1:4095", "1:y", "2:b"}},
     };
     for (const auto& row : rows)
     {

@@ -47,9 +47,9 @@ TEST(Axis, HoldsItsNumbersBetweenRoundOnes)
         double largest;
         std::vector<double> ticks;
     } rows[] = {
-        {"degrees",          0.0,   47.0,  {0.0, 20.0, 40.0, 60.0}     },
-        {"below and above",  -13.0, 188.0, {-100.0, 0.0, 100.0, 200.0} },
-        {"small",            0.0,   0.02,  {0.0, 0.01, 0.02}           },
+        {"degrees", 0.0, 47.0, {0.0, 20.0, 40.0, 60.0}},
+        {"below and above", -13.0, 188.0, {-100.0, 0.0, 100.0, 200.0}},
+        {"small", 0.0, 0.02, {0.0, 0.01, 0.02}},
         {"far from nothing", 901.0, 904.5, {900.0, 902.0, 904.0, 906.0}},
     };
     for (const auto& row : rows)

@@ -15,18 +15,10 @@ constexpr DragKeys kBoth{.leftCtrl = true, .leftShift = true};
 TEST(Camera, LooksAtTheMiddleOfAScene)
 {
     CGLView view;
-    view.SetScene(MakeScene({
-                                {1, 2, 3},
-                                2
-    })
-                      .Get(),
-                  1.0f, 1.0f);
+    view.SetScene(MakeScene({{1, 2, 3}, 2}).Get(), 1.0f, 1.0f);
     view.m_kPan = kVec3One;
     view.m_kCamera.m_kUp = kVec3UnitX;
-    const Ref<CNode> scene = MakeScene({
-        {10, 20, 30},
-        4
-    });
+    const Ref<CNode> scene = MakeScene({{10, 20, 30}, 4});
     view.SetScene(scene.Get(), 1.0f, 1.0f);
     const auto standsAt = [&](const Vec3& lookAt, const Vec3& eye) {
         EXPECT_EQ(view.m_kCamera.m_kLookAt, lookAt);
@@ -56,14 +48,14 @@ TEST(Mouse, DraggingMovesTheCamera)
         DragKeys keys;
     };
     const std::tuple<const char*, std::vector<Move>, Vec3, float> rows[] = {
-        {"right and up pans",             {{110, 95, {}}},                        {10, 5, 0}, 500},
-        {"moves count from the last one", {{110, 95, {}}, {109, 96, {}}},         {9, 4, 0},  500},
-        {"Ctrl and up moves away",        {{110, 95, kCtrl}},                     kVec3Zero,  505},
-        {"the eye stops at 0",            {{100, 601, kCtrl}},                    kVec3Zero,  0  },
-        {"and comes back from there",     {{100, 900, kCtrl}, {100, 890, kCtrl}}, kVec3Zero,  10 },
-        {"Shift holds all",               {{110, 95, kShift}},                    kVec3Zero,  500},
-        {"also with Ctrl",                {{110, 95, kBoth}},                     kVec3Zero,  500},
-        {"held moves are passed over",    {{150, 150, kShift}, {151, 150, {}}},   {1, 0, 0},  500},
+        {"right and up pans", {{110, 95, {}}}, {10, 5, 0}, 500},
+        {"moves count from the last one", {{110, 95, {}}, {109, 96, {}}}, {9, 4, 0}, 500},
+        {"Ctrl and up moves away", {{110, 95, kCtrl}}, kVec3Zero, 505},
+        {"the eye stops at 0", {{100, 601, kCtrl}}, kVec3Zero, 0},
+        {"and comes back from there", {{100, 900, kCtrl}, {100, 890, kCtrl}}, kVec3Zero, 10},
+        {"Shift holds all", {{110, 95, kShift}}, kVec3Zero, 500},
+        {"also with Ctrl", {{110, 95, kBoth}}, kVec3Zero, 500},
+        {"held moves are passed over", {{150, 150, kShift}, {151, 150, {}}}, {1, 0, 0}, 500},
     };
     for (const auto& [what, moves, pan, eyeZ] : rows)
     {

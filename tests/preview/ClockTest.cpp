@@ -46,21 +46,21 @@ void ExpectStand(int eighth, const Operations& operations, float time, bool play
 TEST(Clock, StandsWhereEachOperationLeavesIt)
 {
     const std::tuple<const char*, int, Operations, float, bool> rows[] = {
-        {"a place on the scroll bar",            2, {},                                         0.5f, false},
-        {"a place past its end",                 9, {},                                         2.0f, false},
-        {"a step on",                            2, {&View::StepForward},                       1.0f, false},
-        {"a step back",                          4, {&View::StepBack},                          0.5f, false},
-        {"from between two frames to the end",   7, {&View::StepForward},                       2.0f, false},
-        {"from between two frames to the start", 1, {&View::StepBack},                          0.0f, false},
-        {"no step past the end",                 3, {&View::SeekEnd, &View::StepForward},       2.0f, false},
-        {"no step before the start",             3, {&View::SeekStart, &View::StepBack},        0.0f, false},
-        {"a tick while stopped",                 2, {&View::Advance},                           0.5f, false},
-        {"a tick while playing",                 2, {&View::Play, &View::Advance},              1.0f, true },
-        {"a tick that reaches the end",          6, {&View::Play, &View::Advance},              0.0f, false},
-        {"a tick that passes the end",           7, {&View::Play, &View::Advance},              0.0f, false},
-        {"a tick at the end",                    8, {&View::Play, &View::Advance},              0.0f, false},
-        {"a step while playing",                 2, {&View::Play, &View::StepForward},          1.0f, true },
-        {"a tick after stopping",                2, {&View::Play, &View::Stop, &View::Advance}, 0.5f, false},
+        {"a place on the scroll bar", 2, {}, 0.5f, false},
+        {"a place past its end", 9, {}, 2.0f, false},
+        {"a step on", 2, {&View::StepForward}, 1.0f, false},
+        {"a step back", 4, {&View::StepBack}, 0.5f, false},
+        {"from between two frames to the end", 7, {&View::StepForward}, 2.0f, false},
+        {"from between two frames to the start", 1, {&View::StepBack}, 0.0f, false},
+        {"no step past the end", 3, {&View::SeekEnd, &View::StepForward}, 2.0f, false},
+        {"no step before the start", 3, {&View::SeekStart, &View::StepBack}, 0.0f, false},
+        {"a tick while stopped", 2, {&View::Advance}, 0.5f, false},
+        {"a tick while playing", 2, {&View::Play, &View::Advance}, 1.0f, true},
+        {"a tick that reaches the end", 6, {&View::Play, &View::Advance}, 0.0f, false},
+        {"a tick that passes the end", 7, {&View::Play, &View::Advance}, 0.0f, false},
+        {"a tick at the end", 8, {&View::Play, &View::Advance}, 0.0f, false},
+        {"a step while playing", 2, {&View::Play, &View::StepForward}, 1.0f, true},
+        {"a tick after stopping", 2, {&View::Play, &View::Stop, &View::Advance}, 0.5f, false},
     };
     for (const auto& [what, eighth, operations, time, plays] : rows)
     {

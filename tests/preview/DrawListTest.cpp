@@ -33,16 +33,7 @@ void ExpectLine(const std::vector<LineEnd>& lines, size_t first, const Vec3& fro
 TEST(DrawList, LastSixthOfTheTrianglesIsLeftOut)
 {
     const std::tuple<int32_t, size_t> rows[] = {
-        {0,  0 },
-        {1,  1 },
-        {2,  2 },
-        {3,  3 },
-        {4,  4 },
-        {5,  4 },
-        {6,  5 },
-        {8,  7 },
-        {12, 10},
-        {72, 60},
+        {0, 0}, {1, 1}, {2, 2}, {3, 3}, {4, 4}, {5, 4}, {6, 5}, {8, 7}, {12, 10}, {72, 60},
     };
     for (const auto& [triangles, drawn] : rows)
     {
@@ -65,11 +56,7 @@ TEST(DrawList, TriangleIsAClosedOutlineInTheWorld)
     AttachBone(*scene, "bone", 1, {100, 0, 0});
     scene->UpdateScene(0.0f, true);
     const std::vector<LineEnd> lines = LinesOf(*scene);
-    const Vec3 corners[] = {
-        {90,  -10, 0},
-        {110, -10, 0},
-        {100, 10,  0}
-    };
+    const Vec3 corners[] = {{90, -10, 0}, {110, -10, 0}, {100, 10, 0}};
     for (size_t side = 0; side < 3; ++side)
         ExpectLine(lines, kAxisEnds + 2 * side, corners[side], corners[(side + 1) % 3], kBoneColor);
 }
@@ -78,15 +65,9 @@ TEST(DrawList, TriangleIsAClosedOutlineInTheWorld)
 TEST(DrawList, AxesFollowTheMeshWithItsScale)
 {
     const Ref<CNode> scene = MakeScene({kVec3Zero, 50});
-    AttachBone(*scene, "bone", 0).m_kWorldMatrix = {
-        {0, 2, 0, 0, -1, 0, 0, 0, 0, 0, 0.5f, 0, 7, 8, 9, 1}
-    };
+    AttachBone(*scene, "bone", 0).m_kWorldMatrix = {{0, 2, 0, 0, -1, 0, 0, 0, 0, 0, 0.5f, 0, 7, 8, 9, 1}};
     const std::vector<LineEnd> lines = LinesOf(*scene);
-    const Vec3 tips[] = {
-        {7, 18, 9    },
-        {2, 8,  9    },
-        {7, 8,  11.5f}
-    };
+    const Vec3 tips[] = {{7, 18, 9}, {2, 8, 9}, {7, 8, 11.5f}};
     ASSERT_EQ(lines.size(), kAxisEnds);
     for (size_t axis = 0; axis < 3; ++axis)
         ExpectLine(lines, 2 * axis, {7, 8, 9}, tips[axis], kAxisColors[axis]);
@@ -95,15 +76,9 @@ TEST(DrawList, AxesFollowTheMeshWithItsScale)
 TEST(DrawList, HighlightIsExactlyTheParentsName)
 {
     const std::tuple<const char*, const char*, bool> rows[] = {
-        {"Hips",  "Hips",  true },
-        {"hips",  "Hips",  false},
-        {"Hip",   "Hips",  false},
-        {"Hips2", "Hips",  false},
-        {"mesh",  "Hips",  false},
-        {"scene", "Hips",  false},
-        {"",      "",      false},
-        {"Hips",  nullptr, false},
-        {"",      nullptr, false},
+        {"Hips", "Hips", true},   {"hips", "Hips", false},  {"Hip", "Hips", false},
+        {"Hips2", "Hips", false}, {"mesh", "Hips", false},  {"scene", "Hips", false},
+        {"", "", false},          {"Hips", nullptr, false}, {"", nullptr, false},
     };
     for (const auto& [highlight, parent, shines] : rows)
     {

@@ -122,9 +122,9 @@ TEST_F(PictureTest, ShowsWhatIsBetweenOneAndTenThousandAway)
     if (!m_bCanDraw)
         return;
     const std::tuple<float, bool> rows[] = {
-        {0.98f,     false},
-        {1.02f,     true },
-        {9'800.0f,  true },
+        {0.98f, false},
+        {1.02f, true},
+        {9'800.0f, true},
         {10'200.0f, false},
     };
     for (const auto& [distance, shown] : rows)

@@ -32,12 +32,12 @@ TEST(RenderPicture, ShowsAllMotionsAtTheSameShare)
         Times source;
         Times result;
     } rows[] = {
-        {"one frame",                      2,  1, {1},             {3}            },
-        {"a frame before the first one",   -5, 1, {0},             {0}            },
-        {"a frame after the last one",     9,  1, {2},             {6}            },
-        {"a strip of the motion",          0,  3, {0, 1, 2},       {0, 3, 6}      },
-        {"a strip from a frame on",        2,  2, {1, 2},          {3, 6}         },
-        {"a strip longer than the motion", 3,  3, {1.5f, 1.5f, 2}, {4.5f, 4.5f, 6}},
+        {"one frame", 2, 1, {1}, {3}},
+        {"a frame before the first one", -5, 1, {0}, {0}},
+        {"a frame after the last one", 9, 1, {2}, {6}},
+        {"a strip of the motion", 0, 3, {0, 1, 2}, {0, 3, 6}},
+        {"a strip from a frame on", 2, 2, {1, 2}, {3, 6}},
+        {"a strip longer than the motion", 3, 3, {1.5f, 1.5f, 2}, {4.5f, 4.5f, 6}},
     };
     for (const auto& row : rows)
     {
@@ -88,14 +88,14 @@ TEST(RenderPicture, GivesEachPoseItsPart)
     if (pair.rgb.empty())
         return;
     const std::tuple<const char*, const RgbPicture&, PixelArea, LineColor, LineColor> rows[] = {
-        {"left side",                 pair,  {0, 0, 50, 73},    kBoneColor,      kHighlightColor},
-        {"right side",                pair,  {50, 0, 101, 73},  kHighlightColor, kBoneColor     },
-        {"first pose",                strip, {0, 0, 33, 36},    kBoneColor,      kHighlightColor},
-        {"second pose",               strip, {33, 0, 67, 36},   kBoneColor,      kHighlightColor},
-        {"third pose",                strip, {67, 0, 101, 36},  kBoneColor,      kHighlightColor},
-        {"first pose of the result",  strip, {0, 36, 33, 73},   kHighlightColor, kBoneColor     },
-        {"second pose of the result", strip, {33, 36, 67, 73},  kHighlightColor, kBoneColor     },
-        {"third pose of the result",  strip, {67, 36, 101, 73}, kHighlightColor, kBoneColor     },
+        {"left side", pair, {0, 0, 50, 73}, kBoneColor, kHighlightColor},
+        {"right side", pair, {50, 0, 101, 73}, kHighlightColor, kBoneColor},
+        {"first pose", strip, {0, 0, 33, 36}, kBoneColor, kHighlightColor},
+        {"second pose", strip, {33, 0, 67, 36}, kBoneColor, kHighlightColor},
+        {"third pose", strip, {67, 0, 101, 36}, kBoneColor, kHighlightColor},
+        {"first pose of the result", strip, {0, 36, 33, 73}, kHighlightColor, kBoneColor},
+        {"second pose of the result", strip, {33, 36, 67, 73}, kHighlightColor, kBoneColor},
+        {"third pose of the result", strip, {67, 36, 101, 73}, kHighlightColor, kBoneColor},
     };
     for (const auto& [what, picture, area, shown, missing] : rows)
     {
@@ -109,14 +109,14 @@ TEST(RenderPicture, GivesEachPoseItsPart)
 TEST(RenderPicture, RefusesWhatHasNoPixels)
 {
     const std::tuple<const char*, size_t, int, int, int> rows[] = {
-        {"no motion",              0, 10,               10,      1 },
-        {"no width",               1, 0,                10,      1 },
-        {"a height below 0",       1, 10,               -10,     1 },
-        {"too wide",               1, kLongestSide + 1, 10,      1 },
-        {"too high",               1, 10,               1 << 30, 1 },
-        {"no pose",                1, 10,               10,      0 },
-        {"more poses than pixels", 1, 10,               10,      11},
-        {"more motions than rows", 3, 10,               2,       2 },
+        {"no motion", 0, 10, 10, 1},
+        {"no width", 1, 0, 10, 1},
+        {"a height below 0", 1, 10, -10, 1},
+        {"too wide", 1, kLongestSide + 1, 10, 1},
+        {"too high", 1, 10, 1 << 30, 1},
+        {"no pose", 1, 10, 10, 0},
+        {"more poses than pixels", 1, 10, 10, 11},
+        {"more motions than rows", 3, 10, 2, 2},
     };
     for (const auto& [what, motions, width, height, poses] : rows)
     {

@@ -9,14 +9,14 @@ namespace gw {
 TEST(BoneOffsetDialog, RotationLimitsAreUneven)
 {
     const std::tuple<const char*, int, const char*, const char*> rows[] = {
-        {"X at half a circle",  0, "-180",        "-180"},
-        {"X beyond",            0, "181",         "7"   },
-        {"Y at its limit",      1, "179",         "179" },
-        {"Y at half a circle",  1, "-180",        "7"   },
-        {"Z at half a circle",  2, "180",         "7"   },
-        {"Z with words behind", 2, " -90 deg",    "-90" },
-        {"no number is 0",      0, "",            "0"   },
-        {"beyond 32 bits",      0, "99999999999", "7"   },
+        {"X at half a circle", 0, "-180", "-180"},
+        {"X beyond", 0, "181", "7"},
+        {"Y at its limit", 1, "179", "179"},
+        {"Y at half a circle", 1, "-180", "7"},
+        {"Z at half a circle", 2, "180", "7"},
+        {"Z with words behind", 2, " -90 deg", "-90"},
+        {"no number is 0", 0, "", "0"},
+        {"beyond 32 bits", 0, "99999999999", "7"},
     };
     for (const auto& [what, axis, text, shown] : rows)
     {
@@ -39,11 +39,11 @@ TEST(BoneOffsetDialog, ChosenAxisIsSwappedOutOfTheOtherBoxes)
         AxisCodes before;
         AxisCodes after;
     } rows[] = {
-        {"Y box holds it",          0, "Y",  {1, 2, 3},  {2, 1, 3} },
-        {"reversed counts as held", 0, "-Z", {1, 2, 3},  {-3, 2, 1}},
-        {"old sign goes along",     2, "X",  {1, 2, -3}, {-3, 2, 1}},
-        {"own axis reversed",       1, "-Y", {1, 2, 3},  {1, -2, 3}},
-        {"both boxes hold it",      0, "Y",  {1, 2, -2}, {2, 1, 1} },
+        {"Y box holds it", 0, "Y", {1, 2, 3}, {2, 1, 3}},
+        {"reversed counts as held", 0, "-Z", {1, 2, 3}, {-3, 2, 1}},
+        {"old sign goes along", 2, "X", {1, 2, -3}, {-3, 2, 1}},
+        {"own axis reversed", 1, "-Y", {1, 2, 3}, {1, -2, 3}},
+        {"both boxes hold it", 0, "Y", {1, 2, -2}, {2, 1, 1}},
     };
     for (const auto& row : rows)
     {

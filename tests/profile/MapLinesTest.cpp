@@ -34,19 +34,19 @@ std::string Describe(const MapLine& line)
 TEST(MapLines, LinesSayWhatTheirKeySays)
 {
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"free text",        "Unknown Source",           "text"         },
-        {"empty",            "",                         "text"         },
-        {"position, commas", "Position 1,-2,3",          "at 1,-2,3"    },
-        {"position, blanks", "POSITION 1 -2 3.5",        "at 1,-2,3"    },
-        {"position, cut",    "Position 5",               "at 5,0,0"     },
-        {"frame rate",       "FrameRate 60",             "rate 60"      },
-        {"as first added",   "A <---> Head .",           "A>Head"       },
-        {"with rotation",    "A <---> Head 1,-2,3",      "A>Head 1,-2,3"},
-        {"rotation, blanks", "A <---> Head 1 -2 3",      "A>Head 1,-2,3"},
-        {"a profile's row",  "A <---> Head 1,2,3,3,2,1", "A>Head 1,2,3" },
-        {"the arrow wins",   "Position <---> Head .",    "Position>Head"},
-        {"cut mapping",      "A <--->",                  "A>"           },
-        {"fixed row",        "* Head . .1,2,3",          "fixed Head"   },
+        {"free text", "Unknown Source", "text"},
+        {"empty", "", "text"},
+        {"position, commas", "Position 1,-2,3", "at 1,-2,3"},
+        {"position, blanks", "POSITION 1 -2 3.5", "at 1,-2,3"},
+        {"position, cut", "Position 5", "at 5,0,0"},
+        {"frame rate", "FrameRate 60", "rate 60"},
+        {"as first added", "A <---> Head .", "A>Head"},
+        {"with rotation", "A <---> Head 1,-2,3", "A>Head 1,-2,3"},
+        {"rotation, blanks", "A <---> Head 1 -2 3", "A>Head 1,-2,3"},
+        {"a profile's row", "A <---> Head 1,2,3,3,2,1", "A>Head 1,2,3"},
+        {"the arrow wins", "Position <---> Head .", "Position>Head"},
+        {"cut mapping", "A <--->", "A>"},
+        {"fixed row", "* Head . .1,2,3", "fixed Head"},
     };
     for (const auto& [what, text, says] : rows)
     {

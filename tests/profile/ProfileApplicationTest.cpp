@@ -52,11 +52,11 @@ TEST_F(ProfileEditor, ApplyingFillsTheTablesWithWhatDiffers)
 TEST_F(ProfileEditor, OneMissingBoneFailsTheProfileAndSparesTheOtherRows)
 {
     const std::tuple<const char*, const char*, const char*, bool> rows[] = {
-        {"source missing",       "None x LowerTorso 0\nA x Head 0\n",   "3 of 4, misfit", true },
-        {"target missing",       "B x None 0\nA x Head 0\n",            "3 of 4, misfit", false},
-        {"fixed target missing", "* None . .1,2,3\nA x Head 0\n",       "3 of 4, misfit", false},
-        {"all there, no root",   "A x Head 0\n",                        "3 of 3, fits",   false},
-        {"fixed root counts",    "* lowertorso . .1,2,3\nA x Head 0\n", "4 of 4, fits",   true },
+        {"source missing", "None x LowerTorso 0\nA x Head 0\n", "3 of 4, misfit", true},
+        {"target missing", "B x None 0\nA x Head 0\n", "3 of 4, misfit", false},
+        {"fixed target missing", "* None . .1,2,3\nA x Head 0\n", "3 of 4, misfit", false},
+        {"all there, no root", "A x Head 0\n", "3 of 3, fits", false},
+        {"fixed root counts", "* lowertorso . .1,2,3\nA x Head 0\n", "4 of 4, fits", true},
     };
     for (const auto& [what, lines, verdict, rootMapping] : rows)
     {
@@ -148,11 +148,9 @@ TEST(ProfileFit, NamesTheSideTheLineAndTheNearestBone)
 TEST_F(ProfileEditor, MeasuredFitAgreesWithApplying)
 {
     const std::tuple<const char*, bool> rows[] = {
-        {"A x LowerTorso 0\n",                   true },
-        {"* LowerTorso . .1,2,3\n",              false},
-        {"a x Head 0\nB x head 0\n\n",           false},
-        {"None x LowerTorso 0\nA x LPelvis 0\n", false},
-        {"\n* RPelvis\n* None\n",                false},
+        {"A x LowerTorso 0\n", true},          {"* LowerTorso . .1,2,3\n", false},
+        {"a x Head 0\nB x head 0\n\n", false}, {"None x LowerTorso 0\nA x LPelvis 0\n", false},
+        {"\n* RPelvis\n* None\n", false},
     };
     for (const auto& [lines, drivesRoot] : rows)
     {

@@ -23,13 +23,13 @@ std::string Joined(const std::vector<std::string>& messages)
 TEST_F(ProfileEditor, NumberFieldsAreClampedWithTheirLimits)
 {
     const std::tuple<const char*, int, const char*, const char*, const char*> rows[] = {
-        {"rate too low",            kFrameRateField, "10",          "30",     "157 30 240"      },
-        {"rate too high",           kFrameRateField, "241",         "240",    "157 30 240"      },
-        {"no number",               kFrameRateField, "fast",        "30",     "157 30 240"      },
-        {"offset too low",          kOffsetXField,   "-10001",      "-10000", "157 -10000 10000"},
-        {"beyond 32 bits",          kOffsetZField,   "99999999999", "10000",  "157 -10000 10000"},
-        {"at the limit",            kOffsetYField,   "10000",       "10000",  ""                },
-        {"what follows counts not", kFrameRateField, "60 fps",      "60",     ""                },
+        {"rate too low", kFrameRateField, "10", "30", "157 30 240"},
+        {"rate too high", kFrameRateField, "241", "240", "157 30 240"},
+        {"no number", kFrameRateField, "fast", "30", "157 30 240"},
+        {"offset too low", kOffsetXField, "-10001", "-10000", "157 -10000 10000"},
+        {"beyond 32 bits", kOffsetZField, "99999999999", "10000", "157 -10000 10000"},
+        {"at the limit", kOffsetYField, "10000", "10000", ""},
+        {"what follows counts not", kFrameRateField, "60 fps", "60", ""},
     };
     for (const auto& [what, field, text, shown, message] : rows)
     {
@@ -54,11 +54,9 @@ TEST_F(ProfileEditor, RenameIsTakenOrRefusedWhole)
         std::string name;
         std::string messages;
     } rows[] = {
-        {"free name",        "New one ", "New one", ""   },
-        {"taken name",       "stock",    "Mine",    "158"},
-        {"empty name",       "  ",       "Mine",    "158"},
-        {"case alone",       "MINE",     "Mine",    ""   },
-        {"cut at the limit", e65,        e64,       ""   },
+        {"free name", "New one ", "New one", ""}, {"taken name", "stock", "Mine", "158"},
+        {"empty name", "  ", "Mine", "158"},      {"case alone", "MINE", "Mine", ""},
+        {"cut at the limit", e65, e64, ""},
     };
     for (const auto& row : rows)
     {
@@ -89,16 +87,17 @@ TEST_F(ProfileEditor, OwnerHearsOfEachChangeOfTheProfileSet)
 {
     const std::string path = MakeProfile("Mine\nA x Head 0\n");
     const std::tuple<const char*, std::function<void()>, int> rows[] = {
-        {"counting",    [&] { m_kEditor.CountMatches(path, nullptr, nullptr); }, 0},
-        {"loading",     [&] { m_kEditor.LoadProfile(path); },                    1},
-        {"marking",     [&] { m_kEditor.MarkChanged(); },                        1},
-        {"once marked", [&] { m_kEditor.MarkChanged(); },                        0},
-        {"saving",      [&] { m_kEditor.WriteProfile(EProfileWrite::Quiet); },   1},
+        {"counting", [&] { m_kEditor.CountMatches(path, nullptr, nullptr); }, 0},
+        {"loading", [&] { m_kEditor.LoadProfile(path); }, 1},
+        {"marking", [&] { m_kEditor.MarkChanged(); }, 1},
+        {"once marked", [&] { m_kEditor.MarkChanged(); }, 0},
+        {"saving", [&] { m_kEditor.WriteProfile(EProfileWrite::Quiet); }, 1},
         {"renaming",
          [&] {
              m_kEditor.EditField(kNameField, "Q");
              m_kEditor.LeaveField();
-         },                                                                      1},
+         },
+         1},
     };
     for (const auto& [what, change, setChanges] : rows)
     {
@@ -116,13 +115,13 @@ TEST_F(ProfileEditor, AddToMapNeedsTwoFreeBones)
 {
     Load("N\nA x Waist 0\n");
     const std::tuple<const char*, const char*, const char*, bool> rows[] = {
-        {"both free",                  "B",    "Head",    true },
-        {"nothing selected in source", "none", "Head",    false},
-        {"nothing selected in target", "B",    "none",    false},
-        {"source is mapped",           "A",    "Head",    false},
-        {"target is mapped",           "B",    "Waist",   false},
-        {"pelvis takes no source",     "B",    "LPelvis", false},
-        {"neither does the other",     "B",    "RPelvis", false},
+        {"both free", "B", "Head", true},
+        {"nothing selected in source", "none", "Head", false},
+        {"nothing selected in target", "B", "none", false},
+        {"source is mapped", "A", "Head", false},
+        {"target is mapped", "B", "Waist", false},
+        {"pelvis takes no source", "B", "LPelvis", false},
+        {"neither does the other", "B", "RPelvis", false},
     };
     for (const auto& [what, source, target, addToMap] : rows)
     {
@@ -150,10 +149,10 @@ TEST_F(ProfileEditor, RowButtonsFollowTheSelection)
     Load("N\nA x Waist 0\nB x Head 0\n");
     // selected: digits
     const std::tuple<const char*, const char*, bool, bool> rows[] = {
-        {"none",           "",   false, false},
-        {"one",            "1",  true,  true },
-        {"two",            "01", true,  false},
-        {"a fixed one",    "2",  false, true },
+        {"none", "", false, false},
+        {"one", "1", true, true},
+        {"two", "01", true, false},
+        {"a fixed one", "2", false, true},
         {"one among them", "03", false, false},
     };
     for (const auto& [what, selected, remove, boneOffset] : rows)

@@ -52,14 +52,14 @@ TEST(CProfileTexts, ThePackStandsForFilesThatAreAsTheyWere)
         std::chrono::seconds age; // of A.prf, at the pack's time
         const char* names;
     } rows[] = {
-        {"as packed",           pack,          "edited A",              10s,                              "packed A|packed B|" },
-        {"of one time",         pack,          "edited A",              0s,                               "packed A|packed B|" },
-        {"edited since",        pack,          "edited A",              -10s,                             "edited A|packed B|" },
-        {"of another size",     pack,          "another A",             10s,                              "another A|packed B|"},
-        {"gone",                pack,          "",                      0s,                               "packed B|"          },
-        {"no pack",             "",            "edited A",              10s,                              "edited A|edited B|" },
-        {"a pack that was cut", pack.substr(0, 20),                     "edited A",                       10s,                   "packed A|edited B|"},
-        {"not a pack",                     "A.prf 99999999999\nabcd",                       "edited A", 10s, "edited A|edited B|"                  },
+        {"as packed", pack, "edited A", 10s, "packed A|packed B|"},
+        {"of one time", pack, "edited A", 0s, "packed A|packed B|"},
+        {"edited since", pack, "edited A", -10s, "edited A|packed B|"},
+        {"of another size", pack, "another A", 10s, "another A|packed B|"},
+        {"gone", pack, "", 0s, "packed B|"},
+        {"no pack", "", "edited A", 10s, "edited A|edited B|"},
+        {"a pack that was cut", pack.substr(0, 20), "edited A", 10s, "packed A|edited B|"},
+        {"not a pack", "A.prf 99999999999\nabcd", "edited A", 10s, "edited A|edited B|"},
     };
     for (const auto& row : rows)
     {
@@ -87,27 +87,27 @@ TEST(CProfileTexts, ThePackStandsForFilesThatAreAsTheyWere)
 TEST(ProfileReader, LinesSayWhatTheirFormSays)
 {
     const std::tuple<const char*, std::string, std::string> rows[] = {
-        {"nothing but a name",               "Only a name",                          ""                                            },
-        {"a name and its end",               "Name\n",                               ""                                            },
-        {"keywords in any case",             "N\nFRAMERATE 60\nposition 1 -2 3.9\n", "2 rate 60; 3 at 1,-2,3; "                    },
-        {"a whole mapping row",              "N\nA <---> Head 1,-2,3,-3,2,1\n",      "2 A>Head 1,-2,3 -3,2,1; "                    },
-        {"any second token",                 "N\nA = Head 1,2,3,1,2,3\n",            "2 A>Head 1,2,3 1,2,3; "                      },
-        {"one number alone is a rotation X", "N\nA <---> B 10\n",                    "2 A>B 10,0,0 1,2,3; "                        },
-        {"rotation without axes",            "N\nA <---> B 10,20,30\n",              "2 A>B 10,20,30 1,2,3; "                      },
-        {"some of the axes",                 "N\nA <---> B 1,2,3,-2\n",              "2 A>B 1,2,3 -2,2,3; "                        },
-        {"dotted mapping row",               "N\nA <---> B .-1,3,2\n",               "2 A>B 0,0,0 -1,3,2; "                        },
-        {"a dot alone",                      "N\nA <---> B .\n",                     "2 A>B 0,0,0 1,2,3; "                         },
-        {"a comma first ends the list",      "N\nA <---> B 5,,7,1\n",                "2 A>B 5,0,0 1,2,3; "                         },
-        {"words are 0",                      "N\nA <---> B x,y,z\n",                 "2 A>B 0,0,0 1,2,3; "                         },
-        {"dotted fixed row",                 "N\n* Head . .-1,3,2\n",                "2 [FIXED]>Head 0,0,0 -1,3,2; "               },
-        {"undotted fixed row",               "N\n* Head . 4,5,6,3,2,1\n",            "2 [FIXED]>Head 4,5,6 3,2,1; "                },
-        {"a blank line repeats",             "N\nA <---> B 1,2,3\n\n",               "2 A>B 1,2,3 1,2,3; 3 A>B 1,2,3 1,2,3; "      },
-        {"a short line borrows the tail",    "N\nA <---> B 9\nC <--->\n",
-         "2 A>B 9,0,0 1,2,3; 3 C>B 9,0,0 1,2,3; "                                                                                  },
-        {"a fixed row borrows too",          "N\nA <---> B 9\n* C\n",                "2 A>B 9,0,0 1,2,3; 3 [FIXED]>C 9,0,0 1,2,3; "},
-        {"nothing to borrow yet",            "N\n\n",                                "2 > 0,0,0 1,2,3; "                           },
-        {"CR LF, no last line end",          "N\r\nFrameRate 60\r\nA x B 1",         "2 rate 60; 3 A>B 1,0,0 1,2,3; "              },
-        {"a byte order mark",                "\xef\xbb\xbfN\nFrameRate 60\n",        "2 rate 60; "                                 },
+        {"nothing but a name", "Only a name", ""},
+        {"a name and its end", "Name\n", ""},
+        {"keywords in any case", "N\nFRAMERATE 60\nposition 1 -2 3.9\n", "2 rate 60; 3 at 1,-2,3; "},
+        {"a whole mapping row", "N\nA <---> Head 1,-2,3,-3,2,1\n", "2 A>Head 1,-2,3 -3,2,1; "},
+        {"any second token", "N\nA = Head 1,2,3,1,2,3\n", "2 A>Head 1,2,3 1,2,3; "},
+        {"one number alone is a rotation X", "N\nA <---> B 10\n", "2 A>B 10,0,0 1,2,3; "},
+        {"rotation without axes", "N\nA <---> B 10,20,30\n", "2 A>B 10,20,30 1,2,3; "},
+        {"some of the axes", "N\nA <---> B 1,2,3,-2\n", "2 A>B 1,2,3 -2,2,3; "},
+        {"dotted mapping row", "N\nA <---> B .-1,3,2\n", "2 A>B 0,0,0 -1,3,2; "},
+        {"a dot alone", "N\nA <---> B .\n", "2 A>B 0,0,0 1,2,3; "},
+        {"a comma first ends the list", "N\nA <---> B 5,,7,1\n", "2 A>B 5,0,0 1,2,3; "},
+        {"words are 0", "N\nA <---> B x,y,z\n", "2 A>B 0,0,0 1,2,3; "},
+        {"dotted fixed row", "N\n* Head . .-1,3,2\n", "2 [FIXED]>Head 0,0,0 -1,3,2; "},
+        {"undotted fixed row", "N\n* Head . 4,5,6,3,2,1\n", "2 [FIXED]>Head 4,5,6 3,2,1; "},
+        {"a blank line repeats", "N\nA <---> B 1,2,3\n\n", "2 A>B 1,2,3 1,2,3; 3 A>B 1,2,3 1,2,3; "},
+        {"a short line borrows the tail", "N\nA <---> B 9\nC <--->\n",
+         "2 A>B 9,0,0 1,2,3; 3 C>B 9,0,0 1,2,3; "},
+        {"a fixed row borrows too", "N\nA <---> B 9\n* C\n", "2 A>B 9,0,0 1,2,3; 3 [FIXED]>C 9,0,0 1,2,3; "},
+        {"nothing to borrow yet", "N\n\n", "2 > 0,0,0 1,2,3; "},
+        {"CR LF, no last line end", "N\r\nFrameRate 60\r\nA x B 1", "2 rate 60; 3 A>B 1,0,0 1,2,3; "},
+        {"a byte order mark", "\xef\xbb\xbfN\nFrameRate 60\n", "2 rate 60; "},
     };
     for (const auto& [what, text, lines] : rows)
         EXPECT_EQ(ReadAll(text), lines) << what;
@@ -128,9 +128,9 @@ TEST(ProfileReader, NameIsTheFirstLineWithoutItsEnd)
     const CTempFolder folder;
     const std::tuple<const char*, std::string, std::string> rows[] = {
         {"blanks inside stay, those at the end go", "My own  one \t \r\nFrameRate 30\n", "My own  one"},
-        {"byte order mark",                         "\xef\xbb\xbfName\n",                "Name"       },
-        {"empty file",                              "",                                  ""           },
-        {"empty line",                              "\nFrameRate 30\n",                  ""           },
+        {"byte order mark", "\xef\xbb\xbfName\n", "Name"},
+        {"empty file", "", ""},
+        {"empty line", "\nFrameRate 30\n", ""},
     };
     for (const auto& [what, text, name] : rows)
     {
@@ -186,14 +186,8 @@ TEST(AxisCodes, OtherTextsAndCodesAreNone)
 TEST(AxisCodes, MatrixHasOneColumnForEachRow)
 {
     EXPECT_EQ(AxisMatrix(kNeutralAxes), kMat3Identity);
-    EXPECT_EQ(AxisMatrix({
-                  -1, 3, 2
-    }),
-              (Mat3{{-1, 0, 0, 0, 0, 1, 0, 1, 0}}));
-    EXPECT_EQ(AxisMatrix({
-                  1, -3, 3
-    }),
-              (Mat3{{1, 0, 0, 0, 0, -1, 0, 0, 1}}))
+    EXPECT_EQ(AxisMatrix({-1, 3, 2}), (Mat3{{-1, 0, 0, 0, 0, 1, 0, 1, 0}}));
+    EXPECT_EQ(AxisMatrix({1, -3, 3}), (Mat3{{1, 0, 0, 0, 0, -1, 0, 0, 1}}))
         << "no check rejects two equal axes";
 }
 

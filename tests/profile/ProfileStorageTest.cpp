@@ -50,16 +50,16 @@ TEST_F(ProfileEditor, LaterRowOfATargetKeepsSourceAndFirstRowKeepsRotation)
 TEST_F(ProfileEditor, CountersAndAnswerTellHowAFileFits)
 {
     const std::tuple<const char*, const char*, const char*> rows[] = {
-        {"no rows",              "",                                         "0 of 0, fits"  },
-        {"both found",           "A x Head 0\nB x Waist 0\n",                "2 of 2, fits"  },
-        {"names without case",   "a x HEAD 0\n",                             "1 of 1, fits"  },
-        {"source missing",       "A x Head 0\nNone x Waist 0\n",             "1 of 2, misfit"},
-        {"a bad row first",      "None x Waist 0\nA x Head 0\n",             "1 of 2, misfit"},
-        {"target missing",       "A x None 0\n",                             "0 of 1, fits"  },
-        {"both missing",         "No x None 0\n",                            "0 of 1, fits"  },
-        {"fixed rows count not", "* Head . .1,2,3\n* None . .1,2,3\n",       "0 of 0, fits"  },
-        {"a blank line repeats", "A x Head 0\n\n",                           "2 of 2, fits"  },
-        {"keywords count not",   "FrameRate 60\nPosition 1 2 3\nA x Head\n", "1 of 1, fits"  },
+        {"no rows", "", "0 of 0, fits"},
+        {"both found", "A x Head 0\nB x Waist 0\n", "2 of 2, fits"},
+        {"names without case", "a x HEAD 0\n", "1 of 1, fits"},
+        {"source missing", "A x Head 0\nNone x Waist 0\n", "1 of 2, misfit"},
+        {"a bad row first", "None x Waist 0\nA x Head 0\n", "1 of 2, misfit"},
+        {"target missing", "A x None 0\n", "0 of 1, fits"},
+        {"both missing", "No x None 0\n", "0 of 1, fits"},
+        {"fixed rows count not", "* Head . .1,2,3\n* None . .1,2,3\n", "0 of 0, fits"},
+        {"a blank line repeats", "A x Head 0\n\n", "2 of 2, fits"},
+        {"keywords count not", "FrameRate 60\nPosition 1 2 3\nA x Head\n", "1 of 1, fits"},
     };
     for (const auto& [what, lines, verdict] : rows)
         EXPECT_EQ(Count(MakeProfile(std::string("N\n") + lines)), verdict) << what;
@@ -167,16 +167,16 @@ TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
 {
     // inUse: between bars
     const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
-        {"plain",                   "P",              "P",              "P(1)"             },
-        {"numbered",                "P(1)",           "x|P(1)",         "P(2)"             },
-        {"next is taken",           "A(2)",           "A(2)|a(3) ",     "A(4)"             },
-        {"case and blanks",         "P",              "p  ",            "P(1)"             },
-        {"own entry twice",         "P(1)",           "P(1)|P(1)",      "P(2)"             },
-        {"not listed",              "P",              "Q",              "P"                },
-        {"word in parentheses",     "P (hips)",       "P (hips)",       "P (hips)(1)"      },
-        {"closing one is not last", "P(1) b",         "P(1) b",         "P(1) b(1)"        },
-        {"last pair counts",        "P(3)(4)",        "P(3)(4)",        "P(3)(5)"          },
-        {"number beyond 32 bits",   "P(99999999999)", "P(99999999999)", "P(99999999999)(1)"},
+        {"plain", "P", "P", "P(1)"},
+        {"numbered", "P(1)", "x|P(1)", "P(2)"},
+        {"next is taken", "A(2)", "A(2)|a(3) ", "A(4)"},
+        {"case and blanks", "P", "p  ", "P(1)"},
+        {"own entry twice", "P(1)", "P(1)|P(1)", "P(2)"},
+        {"not listed", "P", "Q", "P"},
+        {"word in parentheses", "P (hips)", "P (hips)", "P (hips)(1)"},
+        {"closing one is not last", "P(1) b", "P(1) b", "P(1) b(1)"},
+        {"last pair counts", "P(3)(4)", "P(3)(4)", "P(3)(5)"},
+        {"number beyond 32 bits", "P(99999999999)", "P(99999999999)", "P(99999999999)(1)"},
     };
     for (const auto& [what, name, inUse, newName] : rows)
     {

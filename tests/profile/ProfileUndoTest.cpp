@@ -68,16 +68,17 @@ TEST_F(ProfileUndo, EveryCommandIsTakenBackAndRepeated)
         return true;
     };
     const std::tuple<const char*, std::function<void()>, const char*> rows[] = {
-        {"add",        [this] { Add("C", "LowerTorso"); },                  "N 30 A-Waist B-Head C-LowerTorso *"},
-        {"remove",     [this] { Remove(0); },                               "N 30 B-Head *"                     },
-        {"remove all", [this] { m_kEditor.ClickButton(kRemoveAllButton); }, "N 30"                              },
-        {"rename",     [this] { Rename("M"); },                             "M 30 A-Waist B-Head *"             },
-        {"rate",       [this] { SetRate("60"); },                           "N 60 A-Waist B-Head *"             },
+        {"add", [this] { Add("C", "LowerTorso"); }, "N 30 A-Waist B-Head C-LowerTorso *"},
+        {"remove", [this] { Remove(0); }, "N 30 B-Head *"},
+        {"remove all", [this] { m_kEditor.ClickButton(kRemoveAllButton); }, "N 30"},
+        {"rename", [this] { Rename("M"); }, "M 30 A-Waist B-Head *"},
+        {"rate", [this] { SetRate("60"); }, "N 60 A-Waist B-Head *"},
         {"offset",
          [this] {
              m_kEditor.SelectOnlyRow(1);
              m_kEditor.DoubleClickRow(1);
-         },                                                                 "N 30 A-Waist B-Head *"             },
+         },
+         "N 30 A-Waist B-Head *"},
     };
     for (const auto& [what, command, after] : rows)
     {

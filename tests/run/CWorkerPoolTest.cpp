@@ -131,9 +131,9 @@ TEST(CWorkerPool, EndsComeInOrderAndFewProcessesDoManyJobs)
 TEST(CWorkerPool, ALostJobCostsItselfOnly)
 {
     const std::tuple<const char*, EDeed, EKind> rows[] = {
-        {"a signal",    EDeed::Crash, EKind::Died    },
-        {"a bare exit", EDeed::Exit,  EKind::Died    },
-        {"no end",      EDeed::Hang,  EKind::TimedOut},
+        {"a signal", EDeed::Crash, EKind::Died},
+        {"a bare exit", EDeed::Exit, EKind::Died},
+        {"no end", EDeed::Hang, EKind::TimedOut},
     };
     for (const auto& [what, deed, kind] : rows)
     {

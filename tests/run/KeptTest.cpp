@@ -55,10 +55,10 @@ TEST(CReportFile, HalfALineOfADeadWriterIsClosedFirst)
 {
     const CTempFolder folder;
     const std::tuple<const char*, const char*, CReportFile::EStart, const char*> rows[] = {
-        {"nothing there",  "",        CReportFile::EStart::AtEnd, "new\n"         },
-        {"whole lines",    "old\n",   CReportFile::EStart::AtEnd, "old\nnew\n"    },
-        {"half a line",    "old\nha", CReportFile::EStart::AtEnd, "old\nha\nnew\n"},
-        {"to be replaced", "old\nha", CReportFile::EStart::Empty, "new\n"         },
+        {"nothing there", "", CReportFile::EStart::AtEnd, "new\n"},
+        {"whole lines", "old\n", CReportFile::EStart::AtEnd, "old\nnew\n"},
+        {"half a line", "old\nha", CReportFile::EStart::AtEnd, "old\nha\nnew\n"},
+        {"to be replaced", "old\nha", CReportFile::EStart::Empty, "new\n"},
     };
     for (const auto& [what, before, start, after] : rows)
     {
@@ -116,15 +116,15 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
         const char* modified;
         bool own;
     } rows[] = {
-        {"about to take its place",        "ready.Kinetra", "digits",     "9.9", true },
-        {"torn by a power failure",        "ready.Kinetra", "torn",       "1.5", true },
-        {"edited",                         "ready.Kinetra", "edited",     "9.9", false},
-        {"an older result",                "made.Kinetra",  "old digits", "9.9", true },
-        {"edited, with its time put back", "made.Kinetra",  "edited",     "1.5", false},
-        {"torn behind the last sync",      "made.Kinetra",  "torn",       "2.5", true },
-        {"made by an earlier version",     "old.Kinetra",   "digits",     "1.5", true },
-        {"edited since then",              "old.Kinetra",   "edited",     "",    false},
-        {"only begun by it",               "begun.Kinetra", "edited",     "",    false},
+        {"about to take its place", "ready.Kinetra", "digits", "9.9", true},
+        {"torn by a power failure", "ready.Kinetra", "torn", "1.5", true},
+        {"edited", "ready.Kinetra", "edited", "9.9", false},
+        {"an older result", "made.Kinetra", "old digits", "9.9", true},
+        {"edited, with its time put back", "made.Kinetra", "edited", "1.5", false},
+        {"torn behind the last sync", "made.Kinetra", "torn", "2.5", true},
+        {"made by an earlier version", "old.Kinetra", "digits", "1.5", true},
+        {"edited since then", "old.Kinetra", "edited", "", false},
+        {"only begun by it", "begun.Kinetra", "edited", "", false},
     };
     for (const auto& row : rows)
         EXPECT_EQ(next.IsOwn(row.output, row.digits, row.modified), row.own) << row.what;
@@ -136,17 +136,18 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
 TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
 {
     const std::tuple<const char*, CProgress, size_t, const char*> rows[] = {
-        {"nothing known", {0, 8, 0, 0.0},       80, "[>                       ] 0/8"                              },
-        {"half",          {5, 10, 0, 2.5},      80, "[============>           ] 5/10  2.5/s  2s left"             },
-        {"minutes",       {0, 10000, 0, 100.0}, 80, "[>                       ] 0/10000  100.0/s  1m40s left"     },
-        {"hours",         {0, 10000, 0, 1.6},   80, "[>                       ] 0/10000  1.6/s  1h44m left"       },
-        {"failures",      {9, 10, 3, 1.0},      80, "[=====================>  ] 9/10  1.0/s  1s left, 3 failed"   },
-        {"the end",       {10, 10, 0, 4.0},     80, "[========================] 10/10  4.0/s  0s left"            },
-        {"no work",       {0, 0, 0, 0.0},       80, "[========================] 0/0"                              },
-        {"little room",   {5, 10, 0, 2.5},      10, "[========="                                                  },
+        {"nothing known", {0, 8, 0, 0.0}, 80, "[>                       ] 0/8"},
+        {"half", {5, 10, 0, 2.5}, 80, "[============>           ] 5/10  2.5/s  2s left"},
+        {"minutes", {0, 10000, 0, 100.0}, 80, "[>                       ] 0/10000  100.0/s  1m40s left"},
+        {"hours", {0, 10000, 0, 1.6}, 80, "[>                       ] 0/10000  1.6/s  1h44m left"},
+        {"failures", {9, 10, 3, 1.0}, 80, "[=====================>  ] 9/10  1.0/s  1s left, 3 failed"},
+        {"the end", {10, 10, 0, 4.0}, 80, "[========================] 10/10  4.0/s  0s left"},
+        {"no work", {0, 0, 0, 0.0}, 80, "[========================] 0/0"},
+        {"little room", {5, 10, 0, 2.5}, 10, "[========="},
         {"all but never",
          {0, 1000000, 0, 0.0001},
-         80,                                        "[>                       ] 0/1000000  0.0/s  277777h46m left"},
+         80,
+         "[>                       ] 0/1000000  0.0/s  277777h46m left"},
     };
     for (const auto& [what, progress, width, line] : rows)
     {

@@ -67,11 +67,8 @@ TEST(PackageMotion, EveryByteIsWhereItBelongs)
         const char* content;
         uint32_t format;
     } rows[] = {
-        {"htr in capitals", "walk.HTR",     "abc", 3},
-        {"cha",             "walk.cha",     "x",   1},
-        {"chb",             "walk.chb",     "y",   2},
-        {"another ending",  "walk.htr.bak", "z",   0},
-        {"empty",           "none.htr",     "",    3},
+        {"htr in capitals", "walk.HTR", "abc", 3},  {"cha", "walk.cha", "x", 1},  {"chb", "walk.chb", "y", 2},
+        {"another ending", "walk.htr.bak", "z", 0}, {"empty", "none.htr", "", 3},
     };
     for (const auto& row : rows)
     {
@@ -157,16 +154,11 @@ TEST(COrrinStream, HeadersAreRefusedByTheirRules)
 {
     // text: 20 characters and what follows
     const std::tuple<const char*, EFailure> rows[] = {
-        {"TKOrrin Version 1.20",  EFailure::None      },
-        {"TKOrrin Version 0.01",  EFailure::None      },
-        {"TKOrrin Version 1. 2",  EFailure::None      },
-        {"TKOrrin Version 1.1x",  EFailure::None      },
-        {"TKOrrin Version 1.21",  EFailure::BadVersion},
-        {"TKOrrin Version 0.00",  EFailure::BadVersion},
-        {"TKOrrin Version 1,20",  EFailure::BadHeader },
-        {"TKOrrin Version 12.0",  EFailure::BadHeader },
-        {"TKOrrin version 1.20",  EFailure::BadHeader },
-        {"TKOrrin Version 1.200", EFailure::BadHeader },
+        {"TKOrrin Version 1.20", EFailure::None},       {"TKOrrin Version 0.01", EFailure::None},
+        {"TKOrrin Version 1. 2", EFailure::None},       {"TKOrrin Version 1.1x", EFailure::None},
+        {"TKOrrin Version 1.21", EFailure::BadVersion}, {"TKOrrin Version 0.00", EFailure::BadVersion},
+        {"TKOrrin Version 1,20", EFailure::BadHeader},  {"TKOrrin Version 12.0", EFailure::BadHeader},
+        {"TKOrrin version 1.20", EFailure::BadHeader},  {"TKOrrin Version 1.200", EFailure::BadHeader},
     };
     const CTempFolder folder;
     for (const auto& [text, reason] : rows)
@@ -243,15 +235,9 @@ TEST(COrrinStream, SizesAreThoseOfTheFormat)
 {
     // memory: 0 where no figure is fixed
     const std::tuple<Ref<CObject>, uint64_t, uint64_t> rows[] = {
-        {new CNode,                108, 212},
-        {new CBillboardNode,       117, 212},
-        {new CCamera,              170, 284},
-        {new CCameraTarget,        106, 188},
-        {new CPointLight,          133, 236},
-        {new CRawData,             56,  56 },
-        {new CAuthorInfo,          71,  68 },
-        {new CKeyframeClipControl, 178, 0  },
-        {new CKeyframeControl,     166, 0  },
+        {new CNode, 108, 212},         {new CBillboardNode, 117, 212},     {new CCamera, 170, 284},
+        {new CCameraTarget, 106, 188}, {new CPointLight, 133, 236},        {new CRawData, 56, 56},
+        {new CAuthorInfo, 71, 68},     {new CKeyframeClipControl, 178, 0}, {new CKeyframeControl, 166, 0},
     };
     for (const auto& [object, disk, memory] : rows)
     {
@@ -311,13 +297,13 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
         uint32_t width, height, format, presence;
         bool whole;
     } rows[] = {
-        {"a size without pixels", 10,         10,    0, 0, true },
-        {"no width",              0,          9,     0, 1, true },
-        {"no height",             9,          0,     0, 1, true },
-        {"no such format",        1,          1,     6, 1, false},
-        {"below 0",               0xffffffff, 1,     0, 1, false},
-        {"more than there is",    99,         99,    5, 1, false},
-        {"a product of 34 bits",  65536,      65536, 0, 1, false},
+        {"a size without pixels", 10, 10, 0, 0, true},
+        {"no width", 0, 9, 0, 1, true},
+        {"no height", 9, 0, 0, 1, true},
+        {"no such format", 1, 1, 6, 1, false},
+        {"below 0", 0xffffffff, 1, 0, 1, false},
+        {"more than there is", 99, 99, 5, 1, false},
+        {"a product of 34 bits", 65536, 65536, 0, 1, false},
     };
     for (const auto& row : rows)
     {

@@ -186,20 +186,8 @@ TEST_F(HTMLDump, SharedObjectsHaveOnePageAndAnEntryAtEachPlace)
         return text + "initializeDocument(Node" + ID(top) + ")\n-->";
     };
     const auto [r, s, o] = std::tuple(root.Get(), shared.Get(), other.Get());
-    EXPECT_THAT(Page("TreeView.htm"), HasSubstr(script(*r, {
-                                                               {r, s},
-                                                               {r, o},
-                                                               {r, s},
-                                                               {s, r},
-                                                               {o, s}
-    })));
-    EXPECT_THAT(Page("TreeView2.htm"), HasSubstr(script(*o, {
-                                                                {o, s},
-                                                                {s, r},
-                                                                {r, s},
-                                                                {r, o},
-                                                                {r, s}
-    })));
+    EXPECT_THAT(Page("TreeView.htm"), HasSubstr(script(*r, {{r, s}, {r, o}, {r, s}, {s, r}, {o, s}})));
+    EXPECT_THAT(Page("TreeView2.htm"), HasSubstr(script(*o, {{o, s}, {s, r}, {r, s}, {r, o}, {r, s}})));
     shared->DetachChild(root.Get());
 }
 
@@ -305,19 +293,19 @@ TEST_F(HTMLDump, APageIsFollowedByThePagesInIt)
 TEST(HTMLText, NamesAreNoMarkupAndNoScript)
 {
     const std::tuple<const char*, std::string_view, std::string_view, std::string_view> rows[] = {
-        {"plain",                                 "Left Foot_1",            "Left Foot_1",             "Left Foot_1"              },
-        {"markup",                                "<b>&\"'",                "&lt;b&gt;&amp;&quot;'",   "\\x3cb>&\\x22'"           },
-        {"end of a text",                         "a\\\"b\r\n",             "a\\&quot;b\r\n",          "a\\x5c\\x22b\\x0d\\x0a"   },
-        {"control bytes",                         "\x1b\x7f",               "\x1b&#127;",              "\\x1b\\x7f"               },
-        {"two, three and four bytes of UTF-8",    "\u00fc\u6771\U0001f9b4", "&#252;&#26481;&#129460;",
-         "\\xfc\\u{6771}\\u{1f9b4}"                                                                                               },
-        {"Big5 whose second byte is a backslash", "\xa5\x5c\"",             "\xa5\x5c&quot;",          "\\u{529f}\\x22"           },
-        {"what only looks so",                    "\x81\x5c\"",             "\x81\x5c&quot;",          "\\x81\\x5c\\x22"          },
-        {"half a character",                      "\xa5<",                  "\xa5&lt;",                "\\xa5\\x3c"               },
-        {"UTF-8 that is longer than it must be",  "\xc0\xbc",               "\xc0\xbc",                "\\u{64d8}"                },
-        {"half of a pair",                        "\xed\xa0\x80",           "\xed\xa0\x80",            "\\xed\\xa0\\x80"          },
-        {"beyond the last character",             "\xf4\x90\x80\x80",       "\xf4\x90\x80\x80",        "\\xf4\\x90\\x80\\x80"     },
-        {"UTF-8 cut short",                       "\u6771\xe6\x9d",         "\u6771\xe6\x9d",          "\\xe6\\x9d\\xb1\\xe6\\x9d"},
+        {"plain", "Left Foot_1", "Left Foot_1", "Left Foot_1"},
+        {"markup", "<b>&\"'", "&lt;b&gt;&amp;&quot;'", "\\x3cb>&\\x22'"},
+        {"end of a text", "a\\\"b\r\n", "a\\&quot;b\r\n", "a\\x5c\\x22b\\x0d\\x0a"},
+        {"control bytes", "\x1b\x7f", "\x1b&#127;", "\\x1b\\x7f"},
+        {"two, three and four bytes of UTF-8", "\u00fc\u6771\U0001f9b4", "&#252;&#26481;&#129460;",
+         "\\xfc\\u{6771}\\u{1f9b4}"},
+        {"Big5 whose second byte is a backslash", "\xa5\x5c\"", "\xa5\x5c&quot;", "\\u{529f}\\x22"},
+        {"what only looks so", "\x81\x5c\"", "\x81\x5c&quot;", "\\x81\\x5c\\x22"},
+        {"half a character", "\xa5<", "\xa5&lt;", "\\xa5\\x3c"},
+        {"UTF-8 that is longer than it must be", "\xc0\xbc", "\xc0\xbc", "\\u{64d8}"},
+        {"half of a pair", "\xed\xa0\x80", "\xed\xa0\x80", "\\xed\\xa0\\x80"},
+        {"beyond the last character", "\xf4\x90\x80\x80", "\xf4\x90\x80\x80", "\\xf4\\x90\\x80\\x80"},
+        {"UTF-8 cut short", "\u6771\xe6\x9d", "\u6771\xe6\x9d", "\\xe6\\x9d\\xb1\\xe6\\x9d"},
     };
     for (const auto& [what, name, page, script] : rows)
     {
@@ -332,14 +320,14 @@ TEST(HTMLText, FloatsWithoutEndAreWords)
     constexpr float kInfinity = std::numeric_limits<float>::infinity();
     const float below = std::nextafter(FLT_MAX, 0.0f);
     const std::tuple<float, std::string_view> rows[] = {
-        {0.0f,       "0.000"                                       },
-        {-1.0005f,   "-1.000"                                      },
-        {FLT_MAX,    "INFINITY"                                    },
-        {-FLT_MAX,   "-INFINITY"                                   },
-        {kInfinity,  "INFINITY"                                    },
-        {-kInfinity, "-INFINITY"                                   },
-        {below,      "340282326356119256160033759537265639424.000" },
-        {-below,     "-340282326356119256160033759537265639424.000"},
+        {0.0f, "0.000"},
+        {-1.0005f, "-1.000"},
+        {FLT_MAX, "INFINITY"},
+        {-FLT_MAX, "-INFINITY"},
+        {kInfinity, "INFINITY"},
+        {-kInfinity, "-INFINITY"},
+        {below, "340282326356119256160033759537265639424.000"},
+        {-below, "-340282326356119256160033759537265639424.000"},
     };
     for (const auto& [value, text] : rows)
         EXPECT_EQ(HTMLText(value), text);

@@ -130,13 +130,13 @@ TEST(CObject, SearchGoesThroughAttachmentsBeforeChildrenAndTheFirstHitWins)
     root->AttachControl(new CTestControl);
     root->AttachControl(clips);
     const std::tuple<const char*, const char*, const CRTTI*, bool, CObject*> rows[] = {
-        {"everything matches the object itself", nullptr, nullptr,                     false, root.Get()},
-        {"name alone",                           "leg",   nullptr,                     false, clips     },
-        {"name and exact class",                 "leg",   &CNode::ms_kRTTI,            false, leg       },
-        {"derived class",                        nullptr, &CKeyframeControl::ms_kRTTI, true,  clips     },
-        {"exact class passes over derived ones", nullptr, &CKeyframeControl::ms_kRTTI, false, nullptr   },
-        {"case counts",                          "Leg",   nullptr,                     false, nullptr   },
-        {"no name is not an empty name",         "",      nullptr,                     false, nullptr   },
+        {"everything matches the object itself", nullptr, nullptr, false, root.Get()},
+        {"name alone", "leg", nullptr, false, clips},
+        {"name and exact class", "leg", &CNode::ms_kRTTI, false, leg},
+        {"derived class", nullptr, &CKeyframeControl::ms_kRTTI, true, clips},
+        {"exact class passes over derived ones", nullptr, &CKeyframeControl::ms_kRTTI, false, nullptr},
+        {"case counts", "Leg", nullptr, false, nullptr},
+        {"no name is not an empty name", "", nullptr, false, nullptr},
     };
     for (const auto& [what, name, record, derived, found] : rows)
     {

@@ -18,12 +18,8 @@ void FillTrack(CKeyframeControl& track)
     track.m_fPhase = 0.25f;
     track.m_bHasRestMatrix = true;
     track.m_kRestMatrix.SetTranslation({1, 2, 3});
-    track.m_kRotationKeys = {
-        kQuatIdentity, Quat{0, 1, 0, 0}
-    };
-    track.m_kPositionKeys = {
-        kVec3One, kVec3UnitX, Vec3{7, 8, 9}
-    };
+    track.m_kRotationKeys = {kQuatIdentity, Quat{0, 1, 0, 0}};
+    track.m_kPositionKeys = {kVec3One, kVec3UnitX, Vec3{7, 8, 9}};
     track.m_kScaleKeys = {kVec3One};
     track.m_kRotationTimes = {1, 2};
     track.m_kPositionTimes = {1, 2, 3};
@@ -86,10 +82,7 @@ CKeyframeClipControl* MakeClips()
     ClipRecord clip{.m_iField = 5, .m_iType = 2, .m_fBegin = 1.0f, .m_fEnd = 4.0f};
     clip.m_acText[0] = 'w';
     clips->m_kClips = {clip, ClipRecord{}};
-    clips->m_kSchedule = {
-        ClipScheduleEntry{0.5f, 1, 3},
-        ClipScheduleEntry{2.5f, 0, 1}
-    };
+    clips->m_kSchedule = {ClipScheduleEntry{0.5f, 1, 3}, ClipScheduleEntry{2.5f, 0, 1}};
     return clips;
 }
 

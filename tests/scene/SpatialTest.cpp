@@ -97,12 +97,12 @@ TEST(CNode, CopySkeletonLeavesAllButNodesBehind)
 TEST(CSpatial, TwoAnswersOfTransformControlsKeepTheOldWorldMatrix)
 {
     const std::tuple<const char*, std::vector<bool>, bool> rows[] = {
-        {"no control",        {},                    true },
-        {"one that rewrote",  {true},                true },
-        {"none that rewrote", {false, false, false}, true },
-        {"one of two",        {false, true},         true },
-        {"two",               {true, true},          false},
-        {"two of three",      {true, false, true},   false},
+        {"no control", {}, true},
+        {"one that rewrote", {true}, true},
+        {"none that rewrote", {false, false, false}, true},
+        {"one of two", {false, true}, true},
+        {"two", {true, true}, false},
+        {"two of three", {true, false, true}, false},
     };
     for (const auto& [what, answers, fresh] : rows)
     {
@@ -122,11 +122,11 @@ TEST(BoundSphere, MergeGrowsJustAsFarAsItMust)
 {
     const BoundSphere unit{kVec3Zero, 1.0f};
     const std::tuple<const char*, BoundSphere, BoundSphere, BoundSphere> rows[] = {
-        {"side by side",                 unit,           {{4, 0, 0}, 1}, {{2, 0, 0}, 3}      },
-        {"unequal",                      unit,           {{5, 0, 0}, 2}, {{3, 0, 0}, 4}      },
-        {"around",                       {{0, 1, 0}, 5}, unit,           {{0, 1, 0}, 5}      },
-        {"inside",                       unit,           {{0, 1, 0}, 5}, {{0, 1, 0}, 5}      },
-        {"equal",                        unit,           unit,           unit                },
+        {"side by side", unit, {{4, 0, 0}, 1}, {{2, 0, 0}, 3}},
+        {"unequal", unit, {{5, 0, 0}, 2}, {{3, 0, 0}, 4}},
+        {"around", {{0, 1, 0}, 5}, unit, {{0, 1, 0}, 5}},
+        {"inside", unit, {{0, 1, 0}, 5}, {{0, 1, 0}, 5}},
+        {"equal", unit, unit, unit},
         {"a point at the origin counts", {{0, 0, 6}, 1}, {kVec3Zero, 0}, {{0, 0, 3.5f}, 3.5f}},
     };
     for (const auto& [what, a, b, merged] : rows)
@@ -137,11 +137,7 @@ TEST(BoundSphere, MergeGrowsJustAsFarAsItMust)
         EXPECT_EQ(sphere.m_kCentre, merged.m_kCentre);
         EXPECT_FLOAT_EQ(sphere.m_fRadius, merged.m_fRadius);
     }
-    const Vec3 points[] = {
-        {-1, 0, 0},
-        {3,  0, 0},
-        {1,  1, 0}
-    };
+    const Vec3 points[] = {{-1, 0, 0}, {3, 0, 0}, {1, 1, 0}};
     EXPECT_EQ(BoundOfPoints(points).m_kCentre, (Vec3{1, 0.5f, 0}));
     EXPECT_FLOAT_EQ(BoundOfPoints(points).m_fRadius, std::sqrt(4.25f));
     EXPECT_EQ(BoundOfPoints({}).m_fRadius, 0.0f);
@@ -152,13 +148,7 @@ namespace {
 class CProbe : public CNode
 {
 public:
-    void UpdateBound() override
-    {
-        m_kBound = {
-            {4, 0, 0},
-            1
-        };
-    }
+    void UpdateBound() override { m_kBound = {{4, 0, 0}, 1}; }
     void ApplyRenderStates(RenderStateStack& stack) override
     {
         for (size_t type = 0; type < kRenderStateTypes; ++type)

@@ -87,26 +87,26 @@ TEST(CControl, MapsTimesByFrequencyPhaseAndCycle)
         float frequency, phase, begin, end;
         float time, keyTime;
     } rows[] = {
-        {"clamp before",                    0,  1,         0, 2, 6,         1,         2},
-        {"clamp behind",                    0,  1,         0, 2, 6,         7,         6},
-        {"phase after frequency",           0,  0.5f,      1, 0, 9,         4,         3},
-        {"loop at its end is at its begin", 1,  1,         0, 2, 6,         6,         2},
-        {"loop before",                     1,  1,         0, 2, 6,         1,         5},
-        {"reverse in period 1",             2,  1,         0, 2, 6,         7,         5},
-        {"reverse in period 2",             2,  1,         0, 2, 6,         11,        3},
-        {"reverse in period -1",            2,  1,         0, 2, 6,         1,         3},
-        {"any other cycle reverses",        77, 1,         0, 2, 6,         7,         5},
-        {"no range to loop in",             1,  1,         0, 2, 2,         9,         2},
-        {"a range the wrong way round",     2,  1,         0, 6, 2,         9,         6},
-        {"clamped the wrong way round",     0,  1,         0, 6, 2,         9,         2},
-        {"no number",                       0,  1,         0, 2, 6,         kNaN,      2},
-        {"frequency that is no number",     2,  kNaN,      0, 2, 6,         1,         2},
-        {"infinite and clamped",            0,  1,         0, 2, 6,         kInfinity, 6},
-        {"infinite in a loop",              1,  1,         0, 2, 6,         kInfinity, 2},
-        {"infinite frequency at 0",         0,  kInfinity, 0, 2, 6,         0,         2},
-        {"endless range",                   1,  1,         0, 2, kInfinity, 9,         2},
-        {"end that is no number",           0,  1,         0, 2, kNaN,      9,         2},
-        {"a quotient beyond all numbers",   1,  1,         0, 0, 1e-30f,    1e30f,     0},
+        {"clamp before", 0, 1, 0, 2, 6, 1, 2},
+        {"clamp behind", 0, 1, 0, 2, 6, 7, 6},
+        {"phase after frequency", 0, 0.5f, 1, 0, 9, 4, 3},
+        {"loop at its end is at its begin", 1, 1, 0, 2, 6, 6, 2},
+        {"loop before", 1, 1, 0, 2, 6, 1, 5},
+        {"reverse in period 1", 2, 1, 0, 2, 6, 7, 5},
+        {"reverse in period 2", 2, 1, 0, 2, 6, 11, 3},
+        {"reverse in period -1", 2, 1, 0, 2, 6, 1, 3},
+        {"any other cycle reverses", 77, 1, 0, 2, 6, 7, 5},
+        {"no range to loop in", 1, 1, 0, 2, 2, 9, 2},
+        {"a range the wrong way round", 2, 1, 0, 6, 2, 9, 6},
+        {"clamped the wrong way round", 0, 1, 0, 6, 2, 9, 2},
+        {"no number", 0, 1, 0, 2, 6, kNaN, 2},
+        {"frequency that is no number", 2, kNaN, 0, 2, 6, 1, 2},
+        {"infinite and clamped", 0, 1, 0, 2, 6, kInfinity, 6},
+        {"infinite in a loop", 1, 1, 0, 2, 6, kInfinity, 2},
+        {"infinite frequency at 0", 0, kInfinity, 0, 2, 6, 0, 2},
+        {"endless range", 1, 1, 0, 2, kInfinity, 9, 2},
+        {"end that is no number", 0, 1, 0, 2, kNaN, 9, 2},
+        {"a quotient beyond all numbers", 1, 1, 0, 0, 1e-30f, 1e30f, 0},
     };
     for (const auto& row : rows)
     {
@@ -167,12 +167,9 @@ TEST(FindKeys, OnTheKeyWhereTheCursorStandsThereIsNoFraction)
         uint32_t cursorBefore, a, b, cursorAfter;
         float fraction;
     } rows[] = {
-        {"on the cursor's key",      1, 1,  1, 1, 1, 0},
-        {"forward onto a key",       2, 0,  2, 3, 2, 0},
-        {"backward onto a key",      1, 2,  0, 1, 1, 1},
-        {"at the first",             0, 2,  0, 0, 0, 0},
-        {"at the last",              4, 0,  3, 3, 3, 0},
-        {"a cursor beyond the axis", 1, 99, 0, 1, 1, 1},
+        {"on the cursor's key", 1, 1, 1, 1, 1, 0}, {"forward onto a key", 2, 0, 2, 3, 2, 0},
+        {"backward onto a key", 1, 2, 0, 1, 1, 1}, {"at the first", 0, 2, 0, 0, 0, 0},
+        {"at the last", 4, 0, 3, 3, 3, 0},         {"a cursor beyond the axis", 1, 99, 0, 1, 1, 1},
     };
     for (const auto& row : rows)
     {
@@ -250,13 +247,13 @@ TEST(CKeyframeControl, DamagedTracksEvaluateToWhatThereIs)
     };
     const std::vector<Vec3> three = Along({1, 2, 3});
     const Row rows[] = {
-        {"fewer keys than times",  {0, 1, 2, 3},       Along({7, 8}), 3.0f, 8.0f},
-        {"one key",                {0, 1, 2, 3},       Along({7}),    1.5f, 7.0f},
-        {"times without keys",     {0, 1},             {},            0.5f, 0.0f},
-        {"more keys than times",   {0},                three,         5.0f, 1.0f},
-        {"time that is no number", {0, 1, 2},          three,         kNaN, 1.0f},
-        {"axis of no numbers",     {kNaN, kNaN, kNaN}, three,         1.0f, 1.0f},
-        {"equal times",            {0, 1, 1, 1, 2},    three,         1.0f, 3.0f},
+        {"fewer keys than times", {0, 1, 2, 3}, Along({7, 8}), 3.0f, 8.0f},
+        {"one key", {0, 1, 2, 3}, Along({7}), 1.5f, 7.0f},
+        {"times without keys", {0, 1}, {}, 0.5f, 0.0f},
+        {"more keys than times", {0}, three, 5.0f, 1.0f},
+        {"time that is no number", {0, 1, 2}, three, kNaN, 1.0f},
+        {"axis of no numbers", {kNaN, kNaN, kNaN}, three, 1.0f, 1.0f},
+        {"equal times", {0, 1, 1, 1, 2}, three, 1.0f, 3.0f},
     };
     for (const Row& row : rows)
     {
@@ -291,11 +288,9 @@ TEST(ParentMask, UndoesTheChosenPartsOfTheParentsKeyPose)
         Mat3 turn; // what the child must undo
         Vec3 scale;
     } rows[] = {
-        {"nothing",            0,     kMat3Identity, kVec3One },
-        {"rotation",           0x38,  turn,          kVec3One },
-        {"scale",              0x1c0, kMat3Identity, {2, 4, 8}},
-        {"scale along y",      0x80,  kMat3Identity, {1, 4, 1}},
-        {"rotation and scale", 0x1f8, turn,          {2, 4, 8}},
+        {"nothing", 0, kMat3Identity, kVec3One},        {"rotation", 0x38, turn, kVec3One},
+        {"scale", 0x1c0, kMat3Identity, {2, 4, 8}},     {"scale along y", 0x80, kMat3Identity, {1, 4, 1}},
+        {"rotation and scale", 0x1f8, turn, {2, 4, 8}},
     };
     for (const auto& row : rows)
     {
@@ -380,28 +375,23 @@ Ref<CKeyframeClipControl> Clips(std::vector<ClipScheduleEntry> schedule)
 
 TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
 {
-    const Ref<CKeyframeClipControl> control = Clips({
-        {5,  0, 2},
-        {40, 1, 1},
-        {60, 3, 1},
-        {70, 4, 1},
-        {80, 9, 1}
-    });
+    const Ref<CKeyframeClipControl> control =
+        Clips({{5, 0, 2}, {40, 1, 1}, {60, 3, 1}, {70, 4, 1}, {80, 9, 1}});
     const std::tuple<const char*, float, float> rows[] = {
-        {"idle before anything is scheduled", 1,             51            },
-        {"idle loops",                        4.5f,          50.5f         },
-        {"one frame early is in time",        5.0f - 0.016f, 10.0f - 0.016f},
-        {"first round",                       7,             12            },
-        {"second round",                      17,            12            },
-        {"the end of the last round",         25,            50            },
-        {"idle from where the rounds ended",  27,            52            },
-        {"a held clip stands at its begin",   47,            30            },
-        {"and has an end too",                51,            51            },
-        {"no length",                         66,            60            },
-        {"backwards has run out at once",     71,            53            }, // 11 behind its end, in a loop of 4
-        {"no such clip",                      85,            3             },
-        {"before all time",                   -kInfinity,    50            },
-        {"no number",                         kNaN,          3             },
+        {"idle before anything is scheduled", 1, 51},
+        {"idle loops", 4.5f, 50.5f},
+        {"one frame early is in time", 5.0f - 0.016f, 10.0f - 0.016f},
+        {"first round", 7, 12},
+        {"second round", 17, 12},
+        {"the end of the last round", 25, 50},
+        {"idle from where the rounds ended", 27, 52},
+        {"a held clip stands at its begin", 47, 30},
+        {"and has an end too", 51, 51},
+        {"no length", 66, 60},
+        {"backwards has run out at once", 71, 53}, // 11 behind its end, in a loop of 4
+        {"no such clip", 85, 3},
+        {"before all time", -kInfinity, 50},
+        {"no number", kNaN, 3},
     };
     for (const auto& [what, time, keyTime] : rows)
     {
@@ -413,10 +403,7 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
 TEST(CKeyframeClipControl, OddClipsComeToAnEnd)
 {
     const Ref<CKeyframeClipControl> control = Clips({});
-    control->m_kSchedule = {
-        ClipScheduleEntry{0,  0, -3},
-        ClipScheduleEntry{10, 4, -1}
-    };
+    control->m_kSchedule = {ClipScheduleEntry{0, 0, -3}, ClipScheduleEntry{10, 4, -1}};
     control->m_kClips[2].m_fEnd = 50.0f + 1e-5f; // a tiny idle clip
     EXPECT_NEAR(control->ClipTime(1.0f), 50.0f, 1e-4f) << "rounds below 0 are none";
     EXPECT_EQ(control->ClipTime(15.0f), 80.0f) << "backwards gives its begin";
@@ -430,9 +417,7 @@ TEST(CKeyframeClipControl, OddClipsComeToAnEnd)
 TEST(CKeyframeClipControl, MapsItsScheduleAndEvaluatesWithItsClamp)
 {
     const Ref<CNode> node = new CNode;
-    const Ref<CKeyframeClipControl> control = Clips({
-        {4, 0, 1}
-    });
+    const Ref<CKeyframeClipControl> control = Clips({{4, 0, 1}});
     node->AttachControl(control.Get());
     control->m_fFrequency = 2.0f;
     control->m_fPhase = 1.0f;

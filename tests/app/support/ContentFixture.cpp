@@ -136,16 +136,9 @@ std::string Leg(const std::string& x, const std::string& thigh, const std::strin
 }
 
 constexpr const char* kTargetBones[][2] = {
-    {"LowerTorso", "GLOBAL"    },
-    {"Waist",      "LowerTorso"},
-    {"LPelvis",    "LowerTorso"},
-    {"LThigh",     "LPelvis"   },
-    {"LCalf",      "LThigh"    },
-    {"LFoot",      "LCalf"     },
-    {"RPelvis",    "LowerTorso"},
-    {"RThigh",     "RPelvis"   },
-    {"RCalf",      "RThigh"    },
-    {"RFoot",      "RCalf"     },
+    {"LowerTorso", "GLOBAL"}, {"Waist", "LowerTorso"}, {"LPelvis", "LowerTorso"}, {"LThigh", "LPelvis"},
+    {"LCalf", "LThigh"},      {"LFoot", "LCalf"},      {"RPelvis", "LowerTorso"}, {"RThigh", "RPelvis"},
+    {"RCalf", "RThigh"},      {"RFoot", "RCalf"},
 };
 
 // A hip, a waist and two legs that hang down; one frame.
@@ -196,13 +189,9 @@ std::string BvhText(const SourceBones& bones, int frameCount)
 std::string BoneMapText(const std::string& name, const SourceBones& bones)
 {
     const std::string rows[][2] = {
-        {bones.hip,        "LowerTorso"},
-        {bones.leftThigh,  "LThigh"    },
-        {bones.leftCalf,   "LCalf"     },
-        {bones.leftFoot,   "LFoot"     },
-        {bones.rightThigh, "RThigh"    },
-        {bones.rightCalf,  "RCalf"     },
-        {bones.rightFoot,  "RFoot"     },
+        {bones.hip, "LowerTorso"},  {bones.leftThigh, "LThigh"},  {bones.leftCalf, "LCalf"},
+        {bones.leftFoot, "LFoot"},  {bones.rightThigh, "RThigh"}, {bones.rightCalf, "RCalf"},
+        {bones.rightFoot, "RFoot"},
     };
     std::string text = name + "\nFrameRate 30\nPosition 0 0 0\n";
     for (const auto& [source, target] : rows)

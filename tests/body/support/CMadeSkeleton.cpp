@@ -11,12 +11,8 @@ namespace gw {
 
 namespace {
 
-constexpr Mat3 kZUp{
-    {1, 0, 0, 0, 0, 1, 0, -1, 0}
-};
-constexpr Mat3 kTurned{
-    {0, 0, 1, 0, 1, 0, -1, 0, 0}
-};
+constexpr Mat3 kZUp{{1, 0, 0, 0, 0, 1, 0, -1, 0}};
+constexpr Mat3 kTurned{{0, 0, 1, 0, 1, 0, -1, 0, 0}};
 
 float SideX(EBodySide side)
 {

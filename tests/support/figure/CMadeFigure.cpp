@@ -10,22 +10,22 @@ namespace gw {
 namespace {
 
 constexpr MadeBone kPerson[] = {
-    {"LowerTorso", "",           {0.0f, 900.0f, 0.0f}   },
-    {"LThigh",     "LowerTorso", {100.0f, 0.0f, 0.0f}   },
-    {"LCalf",      "LThigh",     {0.0f, -400.0f, 0.0f}  },
-    {"LFoot",      "LCalf",      {0.0f, -400.0f, 0.0f}  },
-    {"LToe",       "LFoot",      {0.0f, -70.0f, 150.0f} },
-    {"RThigh",     "LowerTorso", {-100.0f, 0.0f, 0.0f}  },
-    {"RCalf",      "RThigh",     {0.0f, -400.0f, 0.0f}  },
-    {"RFoot",      "RCalf",      {0.0f, -400.0f, 0.0f}  },
-    {"RToe",       "RFoot",      {0.0f, -70.0f, 150.0f} },
-    {"UpperTorso", "LowerTorso", {0.0f, 300.0f, 0.0f}   },
-    {"LUpperArm",  "UpperTorso", {180.0f, 200.0f, 0.0f} },
-    {"LForearm",   "LUpperArm",  {280.0f, 0.0f, 0.0f}   },
-    {"LHand",      "LForearm",   {250.0f, 0.0f, 0.0f}   },
-    {"RUpperArm",  "UpperTorso", {-180.0f, 200.0f, 0.0f}},
-    {"Neck",       "UpperTorso", {0.0f, 250.0f, 0.0f}   },
-    {"Head",       "Neck",       {0.0f, 90.0f, 0.0f}    },
+    {"LowerTorso", "", {0.0f, 900.0f, 0.0f}},
+    {"LThigh", "LowerTorso", {100.0f, 0.0f, 0.0f}},
+    {"LCalf", "LThigh", {0.0f, -400.0f, 0.0f}},
+    {"LFoot", "LCalf", {0.0f, -400.0f, 0.0f}},
+    {"LToe", "LFoot", {0.0f, -70.0f, 150.0f}},
+    {"RThigh", "LowerTorso", {-100.0f, 0.0f, 0.0f}},
+    {"RCalf", "RThigh", {0.0f, -400.0f, 0.0f}},
+    {"RFoot", "RCalf", {0.0f, -400.0f, 0.0f}},
+    {"RToe", "RFoot", {0.0f, -70.0f, 150.0f}},
+    {"UpperTorso", "LowerTorso", {0.0f, 300.0f, 0.0f}},
+    {"LUpperArm", "UpperTorso", {180.0f, 200.0f, 0.0f}},
+    {"LForearm", "LUpperArm", {280.0f, 0.0f, 0.0f}},
+    {"LHand", "LForearm", {250.0f, 0.0f, 0.0f}},
+    {"RUpperArm", "UpperTorso", {-180.0f, 200.0f, 0.0f}},
+    {"Neck", "UpperTorso", {0.0f, 250.0f, 0.0f}},
+    {"Head", "Neck", {0.0f, 90.0f, 0.0f}},
 };
 
 CKeyframeControl& TrackOf(const CNode& node)
