@@ -2,6 +2,7 @@
 
 #include "AlignMotion.h"
 #include "BoneMeshQueries.h"
+#include "CHingeMeter.h"
 #include "CKeyframeControl.h"
 #include "CMadeBody.h"
 #include "CPoseSampler.h"
@@ -301,6 +302,24 @@ TEST(AlignMotion, WorksOnBodiesThatLackJointsAndOnSinglePoses)
         const Vec3 arm = RestLocal(*FindNode(aligned.root.Get(), "LForearm")).Translation();
         EXPECT_LT(AngleBetween(arm, kVec3UnitX), 0.1);
     }
+}
+
+TEST(CHingeMeter, FramesThatHardlyBendHaveNoSay)
+{
+    const CNode bone;
+    CHingeMeter hinge;
+    const auto bend = [&](const Vec3& axis, double degrees, int frames) {
+        for (int frame = 0; frame < frames; ++frame)
+            hinge.Add(-kVec3UnitY, Turned(-kVec3UnitY, TurnAbout(axis, degrees)), bone);
+    };
+    bend(kVec3UnitX, 60.0, 4);
+    EXPECT_FALSE(hinge.Axis()) << "too few";
+    bend(kVec3UnitZ, 10.0, 20);
+    EXPECT_FALSE(hinge.Axis());
+    bend(kVec3UnitX, 60.0, 1);
+    EXPECT_LT(AngleBetween(hinge.Axis().value_or(kVec3Zero), kVec3UnitX), 0.1);
+    bend(kVec3UnitZ, 60.0, 5);
+    EXPECT_FALSE(hinge.Axis()) << "about two axes";
 }
 
 TEST(PlanAlignment, NamesWhatItMends)

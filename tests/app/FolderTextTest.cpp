@@ -22,6 +22,7 @@ TEST(FolderText, NamesAFolderByBothSeparators)
         {"the other separator", "\\takes\\day 1\\", "/takes/day 1/"},
         {"the root", "/", "/"},
         {"a name in the open folder", "takes/day 1", "/home/ann/takes/day 1/"},
+        {"a drive of another system", "C:\\takes", "C:/takes/"},
         {"two backslashes in a row", "/takes\\\\day", nullptr},
         {"two backslashes at the end", "/takes\\\\", nullptr},
         {"two slashes in a row", "//takes", nullptr},

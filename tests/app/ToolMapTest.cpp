@@ -39,6 +39,12 @@ TEST_F(ToolTest, LoadedLinesStandAsTheyWereButForUnknownBones)
     EXPECT_EQ(m_kTool.Status(), "map.txt: 6 lines; 2 mappings without a bone here left out");
     EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.prf;|Nap Files |*.txt;||");
 
+    LoadMap("* Head|x <---> LThigh .|");
+    EXPECT_EQ(m_kTool.Status(), "map.txt: 1 line; 1 mapping without a bone here left out");
+    m_kTool.SelectLine(0);
+    Add("hip", "LowerTorso");
+    EXPECT_EQ(m_kTool.Map().SelectedLine()->text, "* Head") << "the selection moves behind the head";
+
     LoadMap("hip <---> LowerTorso .|Position 4,5,6|");
     EXPECT_EQ(Lines(), std::string(kHead) + "hip <---> LowerTorso .|Position 4,5,6|");
     EXPECT_EQ(m_kTool.Map().RootPosition(), (Vec3{4, 5, 6})) << "behind the head that was put before";

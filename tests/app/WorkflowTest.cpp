@@ -8,6 +8,7 @@
 #include "FindBone.h"
 #include "Paths.h"
 
+#include <algorithm>
 #include <filesystem>
 #include <tuple>
 
@@ -293,6 +294,9 @@ TEST_F(ContentTest, DropsAndRecentFilesOpenAsTheDialogDoes)
     ASSERT_EQ(m_kContent.RecentFiles().size(), 8u);
     EXPECT_EQ(m_kContent.RecentFiles().front(), walk);
     EXPECT_EQ(m_kContent.RecentFiles().back(), m_kFolder.Path("walk2.bvh"));
+    m_kContent.OpenFile(walk);
+    EXPECT_EQ(m_kContent.RecentFiles()[1], m_kFolder.Path("walk8.bvh")) << "once, however often it is opened";
+    EXPECT_EQ(std::ranges::count(m_kPlatform.m_kSettings["RecentFiles"], '\n'), 8);
 
     Do("click convert");
     m_kWindow.m_kAnswers[139] = EAnswer::Cancel;

@@ -107,6 +107,7 @@ TEST(Text, NearestNameIsASlipAwayOrNone)
     const std::tuple<const char*, const char*, const char*> rows[] = {
         {"case has no say", "leftupleg", "LeftUpLeg"},
         {"a letter too many", "Hipss", "Hips"},
+        {"a letter too few", "Spne", "Spine"},
         {"a letter changed", "Spime", "Spine"},
         {"the nearer of two", "LftLeg", "LeftLeg"},
         {"another word", "Head", ""},

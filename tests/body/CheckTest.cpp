@@ -1,3 +1,4 @@
+#include "BodyStance.h"
 #include "BodyTree.h"
 #include "CMadeSkeleton.h"
 #include "CheckBody.h"
@@ -146,6 +147,32 @@ void NameBody(const CBodyMap& body, const char* left, const char* right)
         leg.thigh->SetName((name + "UpLeg").c_str());
         leg.shin->SetName((name + "Leg").c_str());
         leg.foot->SetName((name + "Foot").c_str());
+    }
+}
+
+TEST(BodyStance, VerdictsHaveTheirLimits)
+{
+    constexpr std::optional<double> kNone;
+    const std::tuple<const char*, std::optional<double>, std::optional<double>, std::optional<double>,
+                     ERestPose>
+        rows[] = {
+            {"arms aside", 32.0, 58.0, 5.0, ERestPose::TPose},
+            {"arms half down", 33.0, 57.0, 5.0, ERestPose::APose},
+            {"nearly down", 59.0, 31.0, 5.0, ERestPose::APose},
+            {"down", 60.0, 30.0, 5.0, ERestPose::ArmsDown},
+            {"forward and half up", 66.0, 80.0, 5.0, ERestPose::Other},
+            {"legs that just stand", 10.0, 80.0, 45.0, ERestPose::TPose},
+            {"legs that sit", 10.0, 80.0, 46.0, ERestPose::None},
+            {"legs that are not there", 10.0, 80.0, kNone, ERestPose::TPose},
+            {"arms that are not there", kNone, kNone, 5.0, ERestPose::Unknown},
+        };
+    for (const auto& [what, side, down, thighs, verdict] : rows)
+    {
+        BodyStance stance;
+        stance.armsSide = side;
+        stance.armsDown = down;
+        stance.thighs = thighs;
+        EXPECT_EQ(stance.Verdict(), verdict) << what;
     }
 }
 

@@ -70,7 +70,10 @@ TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
     other.rate = other.declaredRate = 47.0; // nobody's rate, and right
     other.frames = 150;
     const std::string walk = MadeWalk();
+    WalkStyle brief;
+    brief.frames = 5;
     const std::tuple<const char*, std::string> rows[] = {
+        {"a turn in a file too short to tell", WithValues(MadeWalk(brief), 1, kHandY, {"75"})},
         {"a quick turn that stays", WithValues(walk, 87, kHandY, {"75", "75", "75"})},
         {"a strike: out and back on the way", WithValues(walk, 40, kHandY, {"30", "65", "75", "60", "25"})},
         {"a turn given as one more whole turn", WithValues(walk, 40, kHandY, {"360"})},
@@ -91,6 +94,19 @@ TEST(PoseFaults, OfOffsetsAreMendedToBonesOfTheirLength)
     style.repeatsOffsets = true;
     EXPECT_TRUE(CExamined(MadeWalk(style)).Mended() == healthy);
 
+    // One joint that is the other way is left as it is.
+    const auto withHead = [](std::string text, std::initializer_list<const char*> position) {
+        for (size_t axis = 0; axis < 3; ++axis)
+        {
+            for (int frame = 0; frame < 90; ++frame)
+                text = WithValues(text, frame, 6 * 20 + axis, {position.begin()[axis]});
+        }
+        return text;
+    };
+    const char* const nowhere = "0.000000";
+    EXPECT_TRUE(CExamined(withHead(MadeWalk(style), {nowhere, nowhere, nowhere})).Mended() == healthy);
+    EXPECT_EQ(CExamined(withHead(healthy, {nowhere, "10.0", "1.0"})).Found(), "");
+
     style = {};
     style.hipOffset = true;
     CExamined floating(MadeWalk(style));
@@ -110,6 +126,11 @@ TEST(PoseFaults, OfOneFrameAreMendedInPlace)
     const size_t line = LineOfFrame(walk, 40);
     EXPECT_TRUE(WithLine(mended, line, "") == WithLine(walk, line, ""));
     EXPECT_NEAR(ValueOf(mended, 40, kHandY), ValueOf(walk, 40, kHandY), 1e-5);
+    // The short way round where angles jump by a whole turn.
+    std::string turned = walk;
+    for (int frame = 30; frame < 50; ++frame)
+        turned = WithValues(turned, frame, kHandY, {frame < 40 ? "178" : frame == 40 ? "75" : "-178"});
+    EXPECT_NEAR(std::fabs(ValueOf(CExamined(turned).Mended(), 40, kHandY)), 180.0, 1e-5);
     CExamined two(WithValues(walk, 40, kHandY, {"75", "74"}));
     EXPECT_FALSE(two.Exam().Findings().MendsAny());
 }

@@ -3,6 +3,7 @@
 #include "BoneOffset.h"
 #include "CMadeSkeleton.h"
 #include "CRetargeter.h"
+#include "Directions.h"
 #include "FindBone.h"
 #include "MeasureConversion.h"
 #include "ProfileFit.h"
@@ -192,6 +193,7 @@ TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
 {
     std::mt19937 random(5);
     std::uniform_real_distribution<float> angle(-3.1f, 3.1f);
+    double mean = 0.0;
     for (int i = 0; i < 500; ++i)
     {
         const Mat3 rotation = Mat3FromAxisAngle(kVec3UnitX, angle(random)) *
@@ -199,12 +201,14 @@ TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
                               Mat3FromAxisAngle(kVec3UnitZ, angle(random));
         const RowNumbers numbers = NearestOffset(rotation, kVec3UnitY);
         const Mat3 offset = OffsetOf(numbers);
+        mean += AngleBetween(offset.Row(1), rotation.Row(1)) / 500.0;
         EXPECT_GT(Vec3Dot(offset.Row(1), rotation.Row(1)), std::cos(0.75f * kDegreesToRadians));
         EXPECT_GT(Vec3Dot(offset.Row(0), rotation.Row(0)), std::cos(2.5f * kDegreesToRadians));
         // Axis codes take the quarter turns, so that what is left is small.
         for (const int degrees : numbers.rotation)
             EXPECT_LE(std::abs(degrees), 65);
     }
+    EXPECT_LT(mean, 0.31) << "of all whole degrees around, the nearest";
 }
 
 TEST(SuggestedName, IsReadable)

@@ -19,18 +19,22 @@ struct Solved
     CLegSolver::Pose pose;
 };
 
+constexpr Vec3 kStraight{0, kLower, 0};
+constexpr Vec3 kAskew{40, 330, -25}; // an ankle beside and behind the shin
+
 // Solves one leg for a goal in the solver's frame and rebuilds where knee and ankle come to stand.
-Solved Reach(const Vec3& goal, Vec3 hint)
+Solved Reach(const Vec3& goal, Vec3 hint, const Vec3& lower = kStraight)
 {
     CLegSolver solver(1);
-    solver.SetLimb(0, {0, kUpper, 0}, {0, kLower, 0}, kVec3UnitZ, kVec3UnitX);
+    solver.SetLimb(0, {0, kUpper, 0}, lower, kVec3UnitZ, kVec3UnitX);
     Mat4 matrix = kMat4Identity;
     matrix.SetTranslation(goal);
     Solved out{};
     out.ok = solver.Solve(0, hint, matrix, out.pose);
     const Mat4 hip = Mat4Compose(out.pose.hip, kVec3Zero);
     out.knee = TransformCoord({0, 0, -kUpper}, hip);
-    const Vec3 shank = TransformCoord({0, 0, -kLower}, Mat4Compose(out.pose.knee, kVec3Zero));
+    const Vec3 shank =
+        TransformCoord(TransformCoord(lower, AxisSwapForward), Mat4Compose(out.pose.knee, kVec3Zero));
     out.ankle = TransformCoord(shank + Vec3{0, 0, -kUpper}, hip);
     return out;
 }
@@ -62,15 +66,15 @@ TEST(CLegSolver, ReachesRandomGoalsWithTheKneeTowardTheHint)
         const Vec3 goal = Vec3{unit(random), unit(random), unit(random)} * (kUpper + kLower);
         const Vec3 hint = Vec3{unit(random), unit(random), unit(random)} * 800.0f;
         const double distance = Vec3Length(goal);
-        if (distance > 0.999 * (kUpper + kLower) || distance < 30.0)
+        if (distance > 0.98 * (kUpper + kLower) || distance < 80.0)
             continue;
-        ++solved;
+        const Vec3 lower = ++solved % 2 ? kStraight : kAskew;
         SCOPED_TRACE(testing::Message() << goal.x << ' ' << goal.y << ' ' << goal.z);
-        const Solved leg = Reach(goal, hint);
+        const Solved leg = Reach(goal, hint, lower);
         ASSERT_TRUE(leg.ok);
         EXPECT_LT(Vec3Length(leg.ankle - goal), 0.05);
         EXPECT_NEAR(Vec3Length(leg.knee), kUpper, 0.05);
-        EXPECT_NEAR(Vec3Length(leg.ankle - leg.knee), kLower, 0.05);
+        EXPECT_NEAR(Vec3Length(leg.ankle - leg.knee), Vec3Length(lower), 0.05);
         EXPECT_TRUE(IsRotation(leg.pose.hip));
         EXPECT_TRUE(IsRotation(leg.pose.foot));
         if (Vec3Length(AcrossGoal(leg.knee, goal)) > 0.0)
@@ -98,6 +102,7 @@ TEST(CLegSolver, GoalsAtTheLimits)
         {"exactly at the full length, sideways", {full, 0, 0}, true, full},
         {"straight along the hinge's axis", {0, 0, 500}, true, 500},
         {"nearer than the segments can fold", {0, 0, -10}, false, 0},
+        {"hardly nearer than that", {0, 0, -14.9f}, false, 0},
         {"at the hip itself", {0, 0, 0}, false, 0},
     };
     for (const auto& row : rows)
@@ -108,7 +113,7 @@ TEST(CLegSolver, GoalsAtTheLimits)
         if (!row.ok || !leg.ok)
             continue;
         EXPECT_TRUE(IsRotation(leg.pose.hip));
-        EXPECT_NEAR(Vec3Length(leg.ankle), row.reach, 0.05);
+        EXPECT_NEAR(Vec3Length(leg.ankle), row.reach, 0.002);
         EXPECT_LT(Vec3Length(leg.ankle - Vec3Normalized(row.goal) * static_cast<float>(row.reach)), 0.05);
     }
 }

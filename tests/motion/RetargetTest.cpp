@@ -399,7 +399,7 @@ TEST_F(CRetargeterTest, ShareFileLines)
     const struct
     {
         const char* what;
-        const char* line;
+        std::string line;
         const char* bone; // null where none gets shares
         BoneShares shares;
     } rows[] = {
@@ -411,6 +411,10 @@ TEST_F(CRetargeterTest, ShareFileLines)
         {"a name in another case", "wAIST Share 3 1 Type 2", "Waist", {3, 1, 2}},
         {"a bone that is not there", "Tail Share 1 1 Type 1", nullptr, {}},
         {"no numbers", "Neck Share Type", nullptr, {}},
+        {"a line goes on as another behind 1023 bytes",
+         std::string("Waist Share 1 2 Type 0").append(1001, ' ') + "Neck Type 2",
+         "Neck",
+         {1, 2, 2}},
         {"windows line ends", "Waist Share 8 9 Type 1\r\n", "Waist", {8, 9, 1}},
     };
     const std::string path = ::testing::TempDir() + "shares.bsm";

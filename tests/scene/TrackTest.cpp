@@ -181,6 +181,8 @@ TEST(FindKeys, OnTheKeyWhereTheCursorStandsThereIsNoFraction)
         EXPECT_EQ(span.fraction, row.fraction);
         EXPECT_EQ(cursor, row.cursorAfter);
     }
+    KeyCursor cursor = 0;
+    EXPECT_EQ(FindKeys(0.0f, {-kInfinity, 1.0f}, cursor).fraction, 0.0f) << "nor on a way without end";
 }
 
 TEST(CKeyframeControl, RewritesItsTargetFromAllThreeTracks)

@@ -172,7 +172,7 @@ std::string BvhText(const SourceBones& bones, int frameCount)
         "\n{\nOFFSET 0 0 0\nCHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation\n" +
         Leg("9", bones.leftThigh, bones.leftCalf, bones.leftFoot) +
         Leg("-9", bones.rightThigh, bones.rightCalf, bones.rightFoot) +
-        "}\nMOTION\nFrames: " + std::to_string(frameCount) + "\nFrame Time: 0.033333\n";
+        "}\nMOTION\nFrames: " + std::to_string(frameCount) + "\nFrame Time: 0.033334\n";
     for (int frame = 0; frame < frameCount; ++frame)
     {
         const std::string n = std::to_string(5 * frame);
