@@ -2,7 +2,6 @@
 
 #include "AimBones.h"
 #include "AlignMotion.h"
-#include "Angles.h"
 #include "BoneMeshQueries.h"
 #include "CKeyframeControl.h"
 #include "CMadeBody.h"

@@ -11,7 +11,6 @@
 #include "Skeleton.h"
 
 #include <algorithm>
-#include <cmath>
 #include <gtest/gtest.h>
 #include <tuple>
 

@@ -13,7 +13,6 @@
 #include <cmath>
 
 namespace gw {
-
 namespace {
 
 constexpr float kFrequency = 1.0f / 30.0f;

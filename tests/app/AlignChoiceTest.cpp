@@ -4,7 +4,6 @@
 #include "ContentFixture.h"
 
 namespace gw {
-
 namespace {
 
 std::string Replaced(std::string text, const std::string& what, const std::string& with)

@@ -3,7 +3,6 @@
 #include "Paths.h"
 
 namespace gw {
-
 namespace {
 
 std::string Joined(const std::set<std::string>& words)

@@ -6,7 +6,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 std::vector<std::string> Items(const CProfileList& list)
@@ -38,10 +37,7 @@ TEST_F(ContentTest, PathsByDisplayName)
         {"a name that nobody has", "Nobody", ""},
     };
     for (const auto& [what, name, path] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(m_kContent.FindProfilePath(name), path.empty() ? "" : m_kFolder.Path(path));
-    }
+        EXPECT_EQ(m_kContent.FindProfilePath(name), path.empty() ? "" : m_kFolder.Path(path)) << what;
 }
 
 TEST_F(ContentTest, TheCustomFolderIsTheHostsOrTheDocuments)

@@ -3,7 +3,6 @@
 #include <map>
 
 namespace gw {
-
 namespace {
 
 constexpr uint32_t kSectionAddress = 0x1000; // in memory

@@ -11,7 +11,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 // The data block of a name in a package.

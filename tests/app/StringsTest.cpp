@@ -13,7 +13,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 constexpr uint32_t kGerman = 1031;

@@ -18,7 +18,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 namespace fs = std::filesystem;

@@ -13,7 +13,6 @@
 #include <vector>
 
 namespace gw {
-
 namespace {
 
 constexpr float kInfinity = std::numeric_limits<float>::infinity();

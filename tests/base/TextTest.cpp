@@ -7,7 +7,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 // All tokens, or all lines, each with a bar behind it.

@@ -1,14 +1,12 @@
 #include "CMadeSkeleton.h"
 #include "CheckBody.h"
 #include "FindBody.h"
-#include "FindBodyByNames.h"
 #include "FindBodyByShape.h"
 #include "Skeleton.h"
 
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 constexpr unsigned kSeeds = 2; // names, lengths and orders differ by seed
@@ -52,5 +50,4 @@ TEST(CheckBody, HasNoDoubtsAboutTrueBodies)
 }
 
 } // namespace
-
 } // namespace gw

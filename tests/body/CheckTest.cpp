@@ -12,7 +12,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 using enum EBodySide;
@@ -280,5 +279,4 @@ TEST(FindBody, NamesAndShapesOfRealFilesAgree)
 }
 
 } // namespace
-
 } // namespace gw

@@ -9,7 +9,6 @@
 #include <utility>
 
 namespace gw {
-
 namespace {
 
 // A body whose legs hang on helpers of a side's letter. The conventions of other makers are tested with the
@@ -170,5 +169,4 @@ TEST(FindBodyByNames, SaysNothingOfNamesThatSayNothing)
 }
 
 } // namespace
-
 } // namespace gw

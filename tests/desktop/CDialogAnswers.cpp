@@ -11,7 +11,6 @@
 #include <utility>
 
 namespace gw {
-
 namespace {
 
 constexpr int kPatience = 20'000; // milliseconds: other programs may have the processor

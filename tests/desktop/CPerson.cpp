@@ -19,7 +19,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 constexpr int kHumanClick = 120; // milliseconds

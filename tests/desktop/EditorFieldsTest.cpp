@@ -9,8 +9,8 @@
 #include <QFocusEvent>
 #include <QScreen>
 #include <QTest>
-#include <filesystem>
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 
@@ -212,26 +212,21 @@ TEST_F(EditorPlace, AWindowComesBackToWhereItWas)
 TEST_F(EditorPlace, APlaceOfAnotherSizeOrOffTheScreensIsNotUsed)
 {
     const WindowPlacement usual = OpenAndClose();
-    const struct
-    {
-        const char* what;
-        int left, top, width, height;
-        bool used;
-    } rows[] = {
+    const std::tuple<const char*, int, int, int, int, bool> rows[] = {
         {"elsewhere on the screen", 200, 100, 0, 0, true},
         {"wider", 200, 100, 1, 0, false},
         {"lower", 200, 100, 0, -1, false},
         {"far away", 90'000, 100, 0, 0, false},
         {"above all screens", 200, -90'000, 0, 0, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, left, top, width, height, used] : rows)
     {
         WindowPlacement placement;
-        placement.left = row.left;
-        placement.top = row.top;
-        placement.right = row.left + usual.right - usual.left + row.width;
-        placement.bottom = row.top + usual.bottom - usual.top + row.height;
-        EXPECT_EQ(OpenAt(placement) == QPoint(row.left, row.top), row.used) << row.what;
+        placement.left = left;
+        placement.top = top;
+        placement.right = left + usual.right - usual.left + width;
+        placement.bottom = top + usual.bottom - usual.top + height;
+        EXPECT_EQ(OpenAt(placement) == QPoint(left, top), used) << what;
     }
     m_kPlatform.WriteSetting("DialogPos", "0,1,-1,-1,-1,-1,200,100,2147483647");
     CProfileEditorWindow window(m_kContent, m_kPlatform, &m_kOwner);

@@ -6,7 +6,6 @@
 #include <random>
 
 namespace gw {
-
 namespace {
 
 /// Holds a model's rows as a view would: by the changes alone.

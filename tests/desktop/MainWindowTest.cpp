@@ -12,13 +12,11 @@
 #include <QSlider>
 #include <QSurfaceFormat>
 #include <QTest>
-#include <fstream>
 #include <gmock/gmock.h>
 #include <sstream>
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 int ScrollValue(CPerson& person)

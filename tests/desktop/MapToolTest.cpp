@@ -22,7 +22,6 @@
 #include <QUrl>
 
 namespace gw {
-
 namespace {
 
 class MapToolTest : public ContentTest

@@ -12,7 +12,6 @@
 #include <QLineEdit>
 #include <QTest>
 #include <gtest/gtest.h>
-#include <tuple>
 
 namespace gw {
 namespace {
@@ -142,20 +141,13 @@ TEST_F(SelectFolder, GoesIntoFoldersAndUpAgain)
 
 TEST_F(SelectFolder, TakesAPathThatIsWritten)
 {
-    const std::tuple<const char*, std::string, std::string> rows[] = {
-        {"a path", m_kFolder.Path("day 1"), "day 1/"},
-        {"with a separator", m_kFolder.Path("day 1/"), "day 1/"},
-        {"a name", "day 2\\", "day 2/"},
-        {"nothing", "", ""},
-    };
-    for (const auto& [what, text, folder] : rows)
+    for (const std::string& text : {m_kFolder.Path("day 1"), std::string("day 1\\")})
     {
-        SCOPED_TRACE(what);
         Open();
         Write(text);
         QTest::keyClick(Child<QWidget>("102"), Qt::Key_Return);
         EXPECT_EQ(m_pkDialog->result(), QDialog::Accepted);
-        EXPECT_EQ(m_pkDialog->Choice().folder, m_kFolder.Path(folder));
+        EXPECT_EQ(m_pkDialog->Choice().folder, m_kFolder.Path("day 1/"));
     }
 }
 

@@ -1,7 +1,6 @@
 // One healthy file, and one fault in it at a time: exactly that one is found, and where it can be mended the
 // copy is the healthy file again.
 
-#include "CMotionFile.h"
 #include "Examined.h"
 #include "MadeWalk.h"
 

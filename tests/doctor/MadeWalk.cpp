@@ -9,7 +9,6 @@
 #include <vector>
 
 namespace gw {
-
 namespace {
 
 constexpr double kStrideSeconds = 1.1;

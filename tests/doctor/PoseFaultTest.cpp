@@ -3,7 +3,6 @@
 
 #include "CMotionFile.h"
 #include "Examined.h"
-#include "GaitRate.h"
 #include "MadeWalk.h"
 #include "Skeleton.h"
 
@@ -58,10 +57,7 @@ TEST(PoseFaults, AreFound)
         {"30 frames a second said to be 120", MadeWalk(fast), "129 wrong-rate"},
     };
     for (const auto& [what, text, found] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(CExamined(text).Found(), found);
-    }
+        EXPECT_EQ(CExamined(text).Found(), found) << what;
 }
 
 TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
@@ -80,10 +76,7 @@ TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
         {"an odd rate that is right", MadeWalk(other)},
     };
     for (const auto& [what, text] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(CExamined(text).Found(), "");
-    }
+        EXPECT_EQ(CExamined(text).Found(), "") << what;
 }
 
 TEST(PoseFaults, OfOffsetsAreMendedToBonesOfTheirLength)

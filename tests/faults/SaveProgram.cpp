@@ -12,7 +12,6 @@
 #include <string_view>
 
 namespace gw {
-
 namespace {
 
 // A program around the editor whose only profile is a given one, and which says yes to all.
@@ -79,7 +78,6 @@ bool Save(std::string_view kind, const std::string& path)
 }
 
 } // namespace
-
 } // namespace gw
 
 int main(int argc, char** argv)

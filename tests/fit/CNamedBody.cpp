@@ -7,7 +7,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 constexpr const char* kFingers[] = {"Thumb", "Index", "Middle"};

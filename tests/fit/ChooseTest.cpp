@@ -10,7 +10,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 constexpr std::string_view kAssets = GAITWRIGHT_ASSETS;
@@ -254,5 +253,4 @@ TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
 }
 
 } // namespace
-
 } // namespace gw

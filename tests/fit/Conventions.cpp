@@ -1,7 +1,6 @@
 #include "CNamedBody.h"
 
 namespace gw {
-
 namespace {
 
 // clang-format off

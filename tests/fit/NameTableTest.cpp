@@ -9,7 +9,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 // GAITWRIGHT_ASSETS is the folder of the stock profiles.
@@ -153,5 +152,4 @@ TEST_F(NameTable, NamesThatLieWrongAreNeverTakenInSilence)
 }
 
 } // namespace
-
 } // namespace gw

@@ -16,7 +16,6 @@
 #include <random>
 
 namespace gw {
-
 namespace {
 
 std::unique_ptr<CMotionFile> LoadTarget()
@@ -221,5 +220,4 @@ TEST(SuggestedName, IsReadable)
 }
 
 } // namespace
-
 } // namespace gw

@@ -9,7 +9,6 @@
 #include <set>
 
 namespace gw {
-
 namespace {
 
 // Six times the volume that the triangles enclose; above 0 where they look outward. Each edge must be there

@@ -4,7 +4,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 // What every control adds, without a target.

@@ -1,7 +1,6 @@
 #include "ControlSamples.h"
 
 namespace gw {
-
 namespace {
 
 void AddControls(CTriMesh& mesh, CNode& bone)

@@ -10,7 +10,6 @@
 #include <filesystem>
 
 namespace gw {
-
 namespace {
 
 // A mesh of one triangle in which each count stands for itself: no normals although there are 5, no colours

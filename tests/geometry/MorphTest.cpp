@@ -5,7 +5,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 void ExpectPoint(const Vec3& point, const Vec3& expected)

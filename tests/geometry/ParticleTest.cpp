@@ -3,7 +3,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 // A system at (0, 10, 0) whose particles start at its middle.
@@ -45,10 +44,7 @@ TEST(Particles, SlowRatesDoNotStarveAndTimeThatStandsDoesNothing)
         {"time goes back", 1, 2},   {"and on from there", 3, 3},
     };
     for (const auto& row : rows)
-    {
-        SCOPED_TRACE(row.what);
-        EXPECT_EQ(system.ActiveAt(row.time), row.active);
-    }
+        EXPECT_EQ(system.ActiveAt(row.time), row.active) << row.what;
     system.control->m_bActive = false;
     EXPECT_EQ(system.ActiveAt(50.0f), 3);
 }

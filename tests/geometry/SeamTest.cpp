@@ -7,7 +7,6 @@
 #include <random>
 
 namespace gw {
-
 namespace {
 
 void ExpectVector(const Vec3& v, const Vec3& expected)

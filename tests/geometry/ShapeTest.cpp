@@ -8,7 +8,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 template <class T>
@@ -48,10 +47,7 @@ TEST(Shapes, AreHitWhereTheyStandInTheWorld)
         {"the other way round", clockwise.Get(), {1, 1, 100}, true},
     };
     for (const auto& [what, shape, place, hit] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(shape->HitTest(place), hit);
-    }
+        EXPECT_EQ(shape->HitTest(place), hit) << what;
     Vec3 center;
     line->GetCenter(center);
     EXPECT_EQ(center, (Vec3{5, 0, 0}));

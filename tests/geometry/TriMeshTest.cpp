@@ -11,7 +11,6 @@
 #include <random>
 
 namespace gw {
-
 namespace {
 
 void ExpectNormal(const Vec3& normal, const Vec3& expected)

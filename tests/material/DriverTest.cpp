@@ -6,7 +6,6 @@
 #include "TempFolder.h"
 
 #include <cstdio>
-#include <cstring>
 #include <gtest/gtest.h>
 #include <tuple>
 #include <unistd.h>

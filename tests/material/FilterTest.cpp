@@ -71,22 +71,6 @@ TEST(CFilter, KeepWhatTheirColumnsPromise)
     }
 }
 
-// Samples of one value must come out as that value, wherever they are taken.
-TEST(CFilter, PolynomialKernelsAddUpToOne)
-{
-    for (const std::string_view name : {"box", "triangle", "quadratic", "cubic", "catrom", "mitchell"})
-    {
-        const CFilter filter = Named(name, 0.25, 0.4);
-        for (double x = 0.0; x < 1.0; x += 1.0 / 64)
-        {
-            double sum = 0.0;
-            for (int i = -3; i <= 3; ++i)
-                sum += filter(x + i);
-            EXPECT_NEAR(sum, 1.0, kTiny) << name << " " << x;
-        }
-    }
-}
-
 TEST(CFilter, HaveKnownValues)
 {
     const std::tuple<std::string_view, double, double> rows[] = {

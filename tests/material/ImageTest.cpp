@@ -140,13 +140,7 @@ TEST(CImage, PlainPixelsAreWrittenAsTheFormatSays)
 
 TEST(CImage, OddPixelsOfAFileAreReadOrRefused)
 {
-    const struct
-    {
-        const char* what;
-        uint32_t width, height, format, presence;
-        uint16_t storage;
-        bool whole;
-    } rows[] = {
+    const std::tuple<const char*, uint32_t, uint32_t, uint32_t, uint32_t, uint16_t, bool> rows[] = {
         {"a size without pixels", 10, 10, 0, 0, 0, true},
         {"no width", 0, 9, 0, 1, 1, true},
         {"no height", 9, 0, 0, 1, 0, true},
@@ -157,21 +151,20 @@ TEST(CImage, OddPixelsOfAFileAreReadOrRefused)
         {"more than there are", 99, 99, 5, 1, 0, false},
         {"a product of 34 bits", 65536, 65536, 0, 1, 1, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, width, height, format, presence, storage, whole] : rows)
     {
-        SCOPED_TRACE(row.what);
-        CSceneBytes bytes = Scene().Root().Object("CImage", 1).Text("").Add(row.storage).Byte(0);
-        bytes.Words({row.width, row.height, row.format}).Add<uint16_t>(0).Words({96, 96, row.presence});
-        const bool hasPixels = row.width == 2;
+        SCOPED_TRACE(what);
+        CSceneBytes bytes = Scene().Root().Object("CImage", 1).Text("").Add(storage).Byte(0);
+        bytes.Words({width, height, format}).Add<uint16_t>(0).Words({96, 96, presence});
+        const bool hasPixels = width == 2;
         bytes.Raw(hasPixels ? "sixteen bytes..." : "");
         COrrinStream stream;
-        ASSERT_EQ(LoadBytes(stream, bytes.Bytes()), row.whole);
-        if (!row.whole)
+        ASSERT_EQ(LoadBytes(stream, bytes.Bytes()), whole);
+        if (!whole)
             continue;
         CImage& image = static_cast<CImage&>(*stream.GetRoot(0));
         EXPECT_EQ(image.Pixels().IsEmpty(), !hasPixels);
-        EXPECT_EQ(image.Pixels().GetStorage(),
-                  row.storage == 1 ? EPixelStorage::TempStore : EPixelStorage::Heap);
+        EXPECT_EQ(image.Pixels().GetStorage(), storage == 1 ? EPixelStorage::TempStore : EPixelStorage::Heap);
         EXPECT_TRUE(SurvivesRewriting(stream));
     }
 }

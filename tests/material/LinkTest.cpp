@@ -13,7 +13,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 constexpr std::string_view kNote = "ImageLoadFailed.txt";

@@ -10,7 +10,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 CSceneBytes& AddStandardMaterial(CSceneBytes& bytes, uint32_t id, std::initializer_list<uint32_t> textures,

@@ -7,10 +7,10 @@
 
 #include <array>
 #include <climits>
+#include <tuple>
 #include <vector>
 
 namespace gw {
-
 namespace {
 
 constexpr uint8_t kPixel[4] = {1, 2, 3, 4};
@@ -31,12 +31,9 @@ class EveryStorage : public testing::TestWithParam<EPixelStorage>
 
 TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
 {
-    const struct
-    {
-        int32_t width, height, format;
-        bool aligned;
-        size_t stride, block; // 0 for refused
-    } rows[] = {
+    // stride: 0 for refused
+    // block: 0 for refused
+    const std::tuple<int32_t, int32_t, int32_t, bool, size_t, size_t> rows[] = {
         {5, 1, 0, false, 20, 20},       {5, 1, 1, false, 15, 16}, {5, 1, 1, true, 16, 17},
         {5, 3, 2, false, 10, 32},       {5, 3, 3, true, 12, 38},  {5, 3, 4, false, 10, 32},
         {5, 3, 5, true, 8, 27},         {1, 1, 5, false, 1, 4},   {5, 3, 6, false, 0, 0},
@@ -44,15 +41,15 @@ TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
         {-5, 3, 0, false, 0, 0},        {5, -3, 0, false, 0, 0},  {INT_MAX, 2, 0, true, 0, 0},
         {65536, 65536, 5, false, 0, 0},
     };
-    for (const auto& row : rows)
+    for (const auto& [width, height, format, aligned, stride, block] : rows)
     {
-        SCOPED_TRACE(testing::Message() << row.width << " x " << row.height << " in " << row.format);
+        SCOPED_TRACE(testing::Message() << width << " x " << height << " in " << format);
         CPixelBuffer buffer;
-        EXPECT_TRUE(buffer.SetRowAlignment(row.aligned));
-        EXPECT_EQ(buffer.Create(row.width, row.height, row.format), row.block != 0);
-        EXPECT_EQ(buffer.GetStride(), row.stride);
-        EXPECT_EQ(buffer.GetBlockBytes(), row.block);
-        EXPECT_EQ(buffer.SetRowAlignment(!row.aligned), row.block == 0);
+        EXPECT_TRUE(buffer.SetRowAlignment(aligned));
+        EXPECT_EQ(buffer.Create(width, height, format), block != 0);
+        EXPECT_EQ(buffer.GetStride(), stride);
+        EXPECT_EQ(buffer.GetBlockBytes(), block);
+        EXPECT_EQ(buffer.SetRowAlignment(!aligned), block == 0);
     }
 }
 

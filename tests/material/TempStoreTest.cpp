@@ -14,7 +14,6 @@
 #include <sys/stat.h>
 
 namespace gw {
-
 namespace {
 
 constexpr uint64_t kFile = CTempPagedFile::kFileBytes;

@@ -6,7 +6,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 const Mat4 kSkewed{{2, 1, 0, 0.5f, -1, 3, 1, 0, 0, 4, -2, 0.25f, 7, -8, 9, 1}};

@@ -6,9 +6,9 @@
 #include <array>
 #include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
-
 namespace {
 
 constexpr double kRoundingDegrees = 1e-4;
@@ -90,15 +90,8 @@ TEST(Euler, AnglesComeBackInAllOrders)
 // Codes 0 to 3 answer a quarter turn of the middle angle with the opposite sign, codes 4 and 5 with its own.
 TEST(Euler, QuarterTurnsOfTheMiddleAngle)
 {
-    const struct
-    {
-        const char* what;
-        const char* axes; // of the two turns from left to right
-        int order;
-        float first;
-        float second;
-        Vec3 degrees;
-    } rows[] = {
+    // axes: of the two turns from left to right
+    const std::tuple<const char*, const char*, int, float, float, Vec3> rows[] = {
         {"XYZ up", "YX", 0, 90.0f, 30.0f, {-30.0f, -90.0f, 0.0f}},
         {"XYZ down", "YX", 0, -90.0f, 30.0f, {-30.0f, 90.0f, 0.0f}},
         {"ZYX up", "YZ", 1, 90.0f, 30.0f, {0.0f, -90.0f, -30.0f}},
@@ -112,11 +105,11 @@ TEST(Euler, QuarterTurnsOfTheMiddleAngle)
         {"YXZ up", "ZX", 5, 30.0f, 90.0f, {90.0f, 0.0f, 30.0f}},
         {"YXZ down", "ZX", 5, 30.0f, -90.0f, {-90.0f, 0.0f, 30.0f}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, axes, order, first, second, degrees] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const Mat3 m = About(row.axes[0], row.first) * About(row.axes[1], row.second);
-        ExpectNear(ToEulerDegrees(m, row.order), row.degrees, 1e-3);
+        SCOPED_TRACE(what);
+        const Mat3 m = About(axes[0], first) * About(axes[1], second);
+        ExpectNear(ToEulerDegrees(m, order), degrees, 1e-3);
     }
     // A quarter turn of the angle from which X is derived, to the last bit.
     const Mat3 quarter = Mat3FromAxisAngle(kVec3UnitZ, kHalfPi);

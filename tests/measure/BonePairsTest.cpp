@@ -6,7 +6,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 std::string PairText(const BonePair& pair)

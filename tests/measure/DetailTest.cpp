@@ -7,7 +7,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 constexpr int kFrames = 120;

@@ -12,7 +12,6 @@
 #include <vector>
 
 namespace gw {
-
 namespace {
 
 constexpr int kFrames = 120;

@@ -6,6 +6,7 @@
 #include "Skeleton.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -71,12 +72,7 @@ TEST(TKBVHStream, ReadsTheSameMotionWhateverMeansNothing)
 
 TEST(TKBVHStream, MakesNodesOfRootAndJoints)
 {
-    const struct
-    {
-        Change change;
-        std::string tree;
-        int keyCount;
-    } rows[] = {
+    const std::tuple<Change, std::string, int> rows[] = {
         {{"a joint called Site", "JOINT Chest", "JOINT Site"}, "Hips(Site)", 3},
         {{"a joint below an end site", "\t\t\tOFFSET 0 0 5", "JOINT Tip\n{\n}\n"}, "Hips(Chest)", 3},
         {{"a joint outside all blocks", "MOTION", "JOINT Tail\n{\n}\nMOTION"}, "Hips(Chest Tail)", 3},
@@ -86,45 +82,37 @@ TEST(TKBVHStream, MakesNodesOfRootAndJoints)
         {{"no frames", "Frames: 3", "Frames: 0"}, "Hips(Chest)", 0},
         {{"less than no frames", "Frames: 3", "Frames: -7"}, "Hips(Chest)", 0},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, tree, keyCount] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.bvh");
         EXPECT_TRUE(file.loaded);
-        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
-        EXPECT_EQ(file.motion.GetKeyCount(), row.keyCount);
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
+        EXPECT_EQ(file.motion.GetKeyCount(), keyCount);
     }
 }
 
 TEST(TKBVHStream, WarnsAndReadsOn)
 {
-    const struct
-    {
-        Change change;
-        std::string record;
-    } rows[] = {
+    const std::tuple<Change, std::string> rows[] = {
         {{"name of three words", "ROOT Hips", "ROOT Hips of mine"}, "CutName 2 Hips\n"},
         {{"unknown channel", "3 Xrotation Y", "3 Xrotation W"}, "UnknownChannel 9 Wrotation\n"},
         {{"offset with an end", "OFFSET 1 2 3", "OFFSET 1 2 3;"}, "StuckNumber 4 3;\n"},
         {{"two numbers in one", "12 22 32", "12 22.5-7 32"}, "StuckNumber 21 22.5-7\n"},
         {{"short row", "40 50 60", "40 50"}, "ShortRow 20 Chest\n"},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, record] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.bvh");
         EXPECT_TRUE(file.loaded);
-        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+        EXPECT_EQ(RecordText(file.motion.Record()), record);
     }
 }
 
 TEST(TKBVHStream, RefusesWithReasonAndLine)
 {
-    const struct
-    {
-        Change change;
-        const char* record;
-    } rows[] = {
+    const std::tuple<Change, const char*> rows[] = {
         {{"root without a name", "ROOT Hips", "ROOT "}, "BadName 2 "},
         {{"two opening braces", "\tOFFSET 1", "{\n\tOFFSET 1"}, "BadBrace 4 {"},
         {{"no opening brace", "{\n\tOFFSET 1", "\tOFFSET 1"}, "BadBrace 14 }"},
@@ -161,13 +149,13 @@ TEST(TKBVHStream, RefusesWithReasonAndLine)
         {{"hierarchy without a root", "", "HIERARCHY\nMOTION\n"}, "NoRoot 2 ROOT"},
         {{"joint before any root", "", "HIERARCHY\nJOINT a\n{\n}\n"}, "NoRoot 2 a"},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, record] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.bvh");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.bvh");
         EXPECT_FALSE(file.loaded);
         EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), "");
-        EXPECT_EQ(RecordText(file.motion.Record()), std::string("failed ") + row.record + "\n");
+        EXPECT_EQ(RecordText(file.motion.Record()), std::string("failed ") + record + "\n");
     }
 }
 
@@ -239,29 +227,23 @@ TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)
 
 TEST(TKBVHStream, WarnsOfPositionsThatRepeatTheOffsets)
 {
-    const struct
-    {
-        const char* what;
-        std::string offset;
-        std::string position;
-        std::string record;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::string, std::string> rows[] = {
         {"repeated", "0 10 0", "0 10 0", "DoubledOffsets 14 J\n"},
         {"all but repeated", "0 10 0", "0.01 9.99 0", "DoubledOffsets 14 J\n"},
         {"moved from there", "0 10 0", "0 11 0", ""},
         {"nothing to repeat", "0 0 0", "0 0 0", ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, offset, position, record] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const CLoadedMotion file(
-            "HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nOFFSET " + row.offset +
+            "HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nOFFSET " + offset +
                 "\nCHANNELS 3 Xposition Yposition Zposition\n}\n}\nMOTION\nFrames: 1\nFrame Time: "
                 "1\n7 " +
-                row.position + "\n",
+                position + "\n",
             "a.bvh");
         EXPECT_TRUE(file.loaded);
-        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+        EXPECT_EQ(RecordText(file.motion.Record()), record);
     }
 }
 

@@ -9,6 +9,7 @@
 #include "TKBVHStream.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -90,13 +91,7 @@ TEST(TKBVHStream, GivesEveryNodeATrackAndFrames)
 
 TEST(TKBVHStream, PointsBoneMeshesAtTheChild)
 {
-    const struct
-    {
-        const char* what;
-        std::string offset;
-        float length;
-        Vec3 direction;
-    } rows[] = {
+    const std::tuple<const char*, std::string, float, Vec3> rows[] = {
         {"up", "0 3 0", 3, {0, 1, 0}},
         {"down", "0 -3 0", 3, {0, -1, 0}},
         {"along X", "3 0 0", 3, {1, 0, 0}},
@@ -109,18 +104,18 @@ TEST(TKBVHStream, PointsBoneMeshesAtTheChild)
         {"slanted", "3 3 3", 5.1961524f, {0.5f, 0.7071068f, 0.5f}},
         {"nowhere", "0 0 0", 0, {1, 0, 0}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, offset, length, direction] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const CLoadedMotion file("HIERARCHY\nROOT R\n{\nEnd Site\n{\nOFFSET " + row.offset +
+        SCOPED_TRACE(what);
+        const CLoadedMotion file("HIERARCHY\nROOT R\n{\nEnd Site\n{\nOFFSET " + offset +
                                      "\n}\n}\nMOTION\nFrames: 0\nFrame Time: 1\n",
                                  "a.bvh");
         ASSERT_TRUE(file.loaded);
         const CBoneMesh* mesh = FindBoneMesh(*file.motion.motionRoot);
         ASSERT_TRUE(dynamic_cast<const CBoneShapeMesh*>(mesh));
         EXPECT_STREQ(mesh->GetName(), "R");
-        EXPECT_FLOAT_EQ(mesh->m_fLength, row.length);
-        ExpectNear(TransformCoord(kVec3UnitY, mesh->m_kMatrix), row.direction, 1e-6);
+        EXPECT_FLOAT_EQ(mesh->m_fLength, length);
+        ExpectNear(TransformCoord(kVec3UnitY, mesh->m_kMatrix), direction, 1e-6);
     }
 }
 

@@ -1,14 +1,13 @@
 // What a CHA file becomes, and what is refused.
 
 #include "BoneMeshQueries.h"
-#include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "MotionTexts.h"
 #include "Skeleton.h"
 #include "TKCHAStream.h"
 
-#include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -110,13 +109,7 @@ TEST(TKCHAStream, ReadsTheSameMotionWhateverMeansNothing)
 
 TEST(TKCHAStream, ReadsOddFilesAsTheyStand)
 {
-    const struct
-    {
-        Change change;
-        const char* tree;
-        size_t headKeys;
-        const char* record;
-    } rows[] = {
+    const std::tuple<Change, const char*, size_t, const char*> rows[] = {
         {{"unknown parent", "Head Torso", "Head Body"},
          "Torso",
          0,
@@ -150,26 +143,22 @@ TEST(TKCHAStream, ReadsOddFilesAsTheyStand)
          "MissingTokens 2 VersionNumber\n"},
         {{"no frames", "EndFrame 2", "EndFrame -9"}, "Torso(Head)", 0, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, tree, headKeys, record] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.cha");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.cha");
         ASSERT_TRUE(file.loaded) << RecordText(file.motion.Record());
-        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
-        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
+        EXPECT_EQ(RecordText(file.motion.Record()), record);
+        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
         const bool hasHead = FindNode(file.motion.motionRoot.Get(), "Head") != nullptr;
-        EXPECT_EQ(hasHead ? TrackOf(file.motion, "Head").m_kRotationKeys.size() : 0, row.headKeys);
+        EXPECT_EQ(hasHead ? TrackOf(file.motion, "Head").m_kRotationKeys.size() : 0, headKeys);
     }
 }
 
 // Numbers behind a missing comma are not read: those of the segment's row before stay.
 TEST(TKCHAStream, ShortRowsKeepTheNumbersBefore)
 {
-    const struct
-    {
-        Change change;
-        Vec3 position;
-    } rows[] = {
+    const std::tuple<Change, Vec3> rows[] = {
         {{"no comma before the position", "1, 4, 5, 6", "1 4, 5, 6"}, {1, 2, 3}},
         {{"a blank before a comma", "1, 4, 5, 6", "1, 4 , 5, 6"}, {4, 2, 3}},
         {{"a letter behind a number", "1, 4, 5, 6", "1, 4, 5x, 6"}, {4, 5, 3}},
@@ -177,13 +166,13 @@ TEST(TKCHAStream, ShortRowsKeepTheNumbersBefore)
         {{"the end of the line", "1, 4, 5, 6", "1, 4"}, {4, 2, 3}},
         {{"a name alone", " 0, 1, 0, -1, 0, 0, 0, 0, 1, 4, 5, 6", ""}, {1, 2, 3}},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, position] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        CLoadedMotion file(Changed(row.change), "a.cha");
+        SCOPED_TRACE(change.what);
+        CLoadedMotion file(Changed(change), "a.cha");
         ASSERT_TRUE(file.loaded);
         EXPECT_EQ(RecordText(file.motion.Record()), "ShortRow 19 Torso\n");
-        EXPECT_EQ(PosedNode(file.motion, "Torso", 1).m_kMatrix.Translation(), row.position);
+        EXPECT_EQ(PosedNode(file.motion, "Torso", 1).m_kMatrix.Translation(), position);
     }
 }
 

@@ -7,11 +7,11 @@
 #include "Skeleton.h"
 #include "TKCHBStream.h"
 
-#include <cmath>
 #include <cstring>
 #include <gtest/gtest.h>
 #include <limits>
 #include <optional>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -108,28 +108,21 @@ TEST(TKCHBStream, ReadsMatricesAndPositions)
 // As many frames stay unread at the end as the first one's number says, and the keys begin as many later.
 TEST(TKCHBStream, TakesTheBeginFrameTwice)
 {
-    const struct
-    {
-        int begin;
-        int end;
-        size_t keys;
-        Vec3 first;
-        Vec3 last;
-    } rows[] = {
+    const std::tuple<int, int, size_t, Vec3, Vec3> rows[] = {
         {0, 9, 10, {0, 0, 0}, {9, 0, 0}}, {2, 9, 4, {4, 0, 0}, {7, 0, 0}}, {3, 9, 1, {6, 0, 0}, {6, 0, 0}},
         {4, 9, 1, {5, 0, 0}, {5, 0, 0}},  {6, 9, 0, {0, 0, 0}, {0, 0, 0}},
     };
-    for (const auto& row : rows)
+    for (const auto& [begin, end, keys, first, last] : rows)
     {
-        SCOPED_TRACE(row.begin);
-        CLoadedMotion file(SmallCHB(row.begin, row.end), "a.chb");
+        SCOPED_TRACE(begin);
+        CLoadedMotion file(SmallCHB(begin, end), "a.chb");
         ASSERT_TRUE(file.loaded) << RecordText(file.motion.Record());
-        const int frameCount = row.end - row.begin + 1;
+        const int frameCount = end - begin + 1;
         EXPECT_EQ(file.motion.GetKeyCount(), frameCount);
         EXPECT_EQ(file.motion.GetLastFrame(), static_cast<float>(frameCount) - 1.0f);
-        EXPECT_EQ(TrackOf(file.motion, "Torso").m_kPositionKeys.size(), row.keys);
-        EXPECT_EQ(PosedNode(file.motion, "Torso", 0).m_kMatrix.Translation(), row.first);
-        EXPECT_EQ(PosedNode(file.motion, "Torso", frameCount).m_kMatrix.Translation(), row.last);
+        EXPECT_EQ(TrackOf(file.motion, "Torso").m_kPositionKeys.size(), keys);
+        EXPECT_EQ(PosedNode(file.motion, "Torso", 0).m_kMatrix.Translation(), first);
+        EXPECT_EQ(PosedNode(file.motion, "Torso", frameCount).m_kMatrix.Translation(), last);
     }
 }
 
@@ -138,13 +131,7 @@ TEST(TKCHBStream, ReadsOddFilesAsTheyStand)
     const std::string plain = SmallCHB(0, 3);
     const float nan = std::numeric_limits<float>::quiet_NaN();
     const size_t parent = kFirstName + 2 * 260 + 11 + 3 * 256; // of the head
-    const struct
-    {
-        const char* what;
-        std::string bytes;
-        const char* tree;
-        const char* record;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*, const char*> rows[] = {
         {"keywords in any case", Patched(Patched(plain, 0, "[header]"), kFirstFrame - 5, "fRAME"),
          "Torso(Head)", ""},
         {"an old version", Patched(plain, kIntOffsets[0], Bytes(-5)), "Torso(Head)", ""},
@@ -158,13 +145,13 @@ TEST(TKCHBStream, ReadsOddFilesAsTheyStand)
         {"its own parent", Patched(plain, parent, Name("Head")), "Torso", ""},
         {"no frames", Patched(plain, kIntOffsets[kEnd], Bytes(-7)), "Torso(Head)", ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, bytes, tree, record] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const CLoadedMotion file(row.bytes, "a.chb");
+        SCOPED_TRACE(what);
+        const CLoadedMotion file(bytes, "a.chb");
         EXPECT_TRUE(file.loaded);
-        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
-        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
+        EXPECT_EQ(RecordText(file.motion.Record()), record);
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
     }
 }
 
@@ -211,25 +198,20 @@ TEST(TKCHBStream, ThrowsWithTheNumberOfKeywords)
 {
     const CTempFolder folder;
     const std::string plain = SmallCHB(0, 3);
-    const struct
-    {
-        const char* what;
-        std::string bytes;
-        const char* text;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*> rows[] = {
         {"the first keyword", Patched(plain, 0, "[FOOTER]"), "At Line: 1"},
         {"a frame's keyword", Patched(plain, kFirstFrame - 5, "Flame"), "At Line: 10"},
         {"a frame's number", Patched(plain, kFirstFrame, Bytes(1)), "At Line: 10"},
         {"a version", Patched(plain, kIntOffsets[0], Bytes(722)), ""},
         {"a file that is cut", plain.substr(0, plain.size() - 1), ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, bytes, text] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const std::optional<ERROBJ> error = Thrown(folder, row.bytes);
+        SCOPED_TRACE(what);
+        const std::optional<ERROBJ> error = Thrown(folder, bytes);
         ASSERT_TRUE(error);
         EXPECT_EQ(error->code, 2);
-        EXPECT_STREQ(error->what, row.text);
+        EXPECT_STREQ(error->what, text);
         int line = 0;
         EXPECT_EQ(std::sscanf(error->where, "TKCHBStream Line:%d", &line), 1) << error->where;
         EXPECT_GT(line, 0);

@@ -6,7 +6,6 @@
 #include <cmath>
 
 namespace gw {
-
 namespace {
 
 constexpr float kUpper = 45.0f;

@@ -12,6 +12,7 @@
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -287,14 +288,7 @@ TEST(TKHTRStream, WritesTheseBytes)
             text.append(std::to_string(number++)).append(" ").append(row);
         return text;
     };
-    const struct
-    {
-        const char* what;
-        float frameScale;
-        const char* frames;
-        std::string torso;
-        std::string head;
-    } rows[] = {
+    const std::tuple<const char*, float, const char*, std::string, std::string> rows[] = {
         {"as it is", 1.0f, "2", rowsOf({begin, end}), rowsOf({still, still})},
         {"twice", 2.0f, "4", rowsOf({begin, middle, end, end}), rowsOf({still, still, still, still})},
         {"half", 0.5f, "1", rowsOf({begin}), rowsOf({still})},
@@ -303,11 +297,11 @@ TEST(TKHTRStream, WritesTheseBytes)
     };
     CLoadedMotion file(kMoving, "a.htr");
     ASSERT_TRUE(file.loaded);
-    for (const auto& row : rows)
+    for (const auto& [what, frameScale, frames, torso, head] : rows)
     {
-        SCOPED_TRACE(row.what);
-        ASSERT_TRUE(file.motion.Save(file.folder.Path("b.HTR"), row.frameScale));
-        EXPECT_EQ(ReadBytes(file.folder.Path("b.HTR")), Written(row.frames, row.torso, row.head));
+        SCOPED_TRACE(what);
+        ASSERT_TRUE(file.motion.Save(file.folder.Path("b.HTR"), frameScale));
+        EXPECT_EQ(ReadBytes(file.folder.Path("b.HTR")), Written(frames, torso, head));
     }
 }
 

@@ -1,9 +1,9 @@
-#include "Angles.h"
 #include "CLegSolver.h"
 
 #include <cmath>
 #include <gtest/gtest.h>
 #include <random>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -90,13 +90,8 @@ TEST(CLegSolver, GoalsAtTheLimits)
     Vec3 atReach = {full, 0, 0};
     EXPECT_FALSE(CLimbChain::ClampGoal({0, kUpper, 0}, {0, 0, kLower}, atReach));
     EXPECT_EQ(atReach, (Vec3{full, 0, 0}));
-    const struct
-    {
-        const char* what;
-        Vec3 goal;
-        bool ok;
-        double reach; // how far from the hip the ankle comes to stand
-    } rows[] = {
+    // reach: how far from the hip the ankle comes to stand
+    const std::tuple<const char*, Vec3, bool, double> rows[] = {
         {"far out of reach is drawn in to just short of straight", {0, 0, -2000}, true, full / 1.00001},
         {"exactly at the full length", {0, 0, -full}, true, full},
         {"exactly at the full length, sideways", {full, 0, 0}, true, full},
@@ -105,16 +100,16 @@ TEST(CLegSolver, GoalsAtTheLimits)
         {"hardly nearer than that", {0, 0, -14.9f}, false, 0},
         {"at the hip itself", {0, 0, 0}, false, 0},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, goal, ok, reach] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const Solved leg = Reach(row.goal, {500, 100, -300});
-        EXPECT_EQ(leg.ok, row.ok);
-        if (!row.ok || !leg.ok)
+        SCOPED_TRACE(what);
+        const Solved leg = Reach(goal, {500, 100, -300});
+        EXPECT_EQ(leg.ok, ok);
+        if (!ok || !leg.ok)
             continue;
         EXPECT_TRUE(IsRotation(leg.pose.hip));
-        EXPECT_NEAR(Vec3Length(leg.ankle), row.reach, 0.002);
-        EXPECT_LT(Vec3Length(leg.ankle - Vec3Normalized(row.goal) * static_cast<float>(row.reach)), 0.05);
+        EXPECT_NEAR(Vec3Length(leg.ankle), reach, 0.002);
+        EXPECT_LT(Vec3Length(leg.ankle - Vec3Normalized(goal) * static_cast<float>(reach)), 0.05);
     }
 }
 

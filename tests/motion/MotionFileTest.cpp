@@ -8,18 +8,14 @@
 #include <cstdlib>
 #include <gtest/gtest.h>
 #include <limits>
+#include <tuple>
 
 namespace gw {
 namespace {
 
 TEST(CMotionFile, ChoosesByTheExtension)
 {
-    const struct
-    {
-        const char* name;
-        std::string_view text;
-        const char* tree;
-    } rows[] = {
+    const std::tuple<const char*, std::string_view, const char*> rows[] = {
         {"a.bvh", kSmallBVH, "Hips(Chest)"},
         {"a.Bvh", kSmallBVH, "Hips(Chest)"},
         {"a.BVH", kSmallBVH, "Hips(Chest)"},
@@ -32,13 +28,13 @@ TEST(CMotionFile, ChoosesByTheExtension)
         {"a.txt", kSmallBVH, ""},
         {"bvh", kSmallBVH, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [name, text, tree] : rows)
     {
-        SCOPED_TRACE(row.name);
-        const CLoadedMotion file(row.text, row.name);
-        EXPECT_EQ(file.loaded, *row.tree != '\0');
-        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
-        EXPECT_EQ(static_cast<bool>(file.motion.restRoot), file.loaded && row.text == kSmallHTR);
+        SCOPED_TRACE(name);
+        const CLoadedMotion file(text, name);
+        EXPECT_EQ(file.loaded, *tree != '\0');
+        EXPECT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
+        EXPECT_EQ(static_cast<bool>(file.motion.restRoot), file.loaded && text == kSmallHTR);
         EXPECT_NE(file.loaded, static_cast<bool>(file.motion.Record().Failure()));
     }
 }
@@ -51,27 +47,22 @@ TEST(CMotionFile, KeepsItsTreesWhenALoadFails)
     const Ref<CNode> rest = file.motion.restRoot;
     WriteBytes(file.folder.Path("bad.htr"), "[Header]\n");
     WriteBytes(file.folder.Path("other.txt"), "no motion");
-    const struct
-    {
-        std::string path;
-        bool loaded;
-        const char* record;
-    } rows[] = {
+    const std::tuple<std::string, bool, const char*> rows[] = {
         {"", false, "failed NotFound 0 \n"},
         {file.folder.Path("none.bvh"), false, "failed NotFound 0 \n"},
         {file.folder.Path("bad.htr"), false, "failed MissingSection 1 [SegmentNames&Hierarchy]\n"},
         {file.folder.Path("other.txt"), true, ""},
         {file.folder.Path("none.txt"), true, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [path, loaded, record] : rows)
     {
-        SCOPED_TRACE(row.path);
+        SCOPED_TRACE(path);
         motion->UpdateScene(1.0f, true);
-        EXPECT_EQ(file.motion.Load(row.path), row.loaded);
-        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+        EXPECT_EQ(file.motion.Load(path), loaded);
+        EXPECT_EQ(RecordText(file.motion.Record()), record);
         EXPECT_TRUE(file.motion.motionRoot == motion && file.motion.restRoot == rest);
         const Vec3 first{1, 102, 3};
-        EXPECT_EQ(motion->m_kMatrix.Translation() == first, row.loaded) << "stands at time 0 again";
+        EXPECT_EQ(motion->m_kMatrix.Translation() == first, loaded) << "stands at time 0 again";
     }
     WriteBytes(file.folder.Path("good.bvh"), kSmallBVH);
     ASSERT_TRUE(file.motion.Load(file.folder.Path("good.bvh")));
@@ -84,13 +75,7 @@ TEST(CMotionFile, WritesNothingItCannotWriteWhole)
     CLoadedMotion htr(kSmallHTR, "a.htr");
     const CLoadedMotion bvh(kSmallBVH, "a.bvh");
     CMotionFile withoutRest(bvh.motion);
-    const struct
-    {
-        CMotionFile& motion;
-        std::string name;
-        float frameScale;
-        const char* record;
-    } rows[] = {
+    const std::tuple<CMotionFile&, std::string, float, const char*> rows[] = {
         {htr.motion, "b.bvh", 1.0f, "failed UnknownFormat 0 \n"},
         {htr.motion, "b", 1.0f, "failed UnknownFormat 0 \n"},
         {htr.motion, "none/b.htr", 1.0f, "failed WriteError 0 \n"},
@@ -98,11 +83,11 @@ TEST(CMotionFile, WritesNothingItCannotWriteWhole)
         {htr.motion, "b.htr", std::numeric_limits<float>::quiet_NaN(), "failed TooLarge 0 \n"},
         {withoutRest, "b.htr", 1.0f, "failed NoRoot 0 \n"},
     };
-    for (const auto& row : rows)
+    for (const auto& [motion, name, frameScale, record] : rows)
     {
-        SCOPED_TRACE(row.name + row.record);
-        EXPECT_FALSE(row.motion.Save(htr.folder.Path(row.name), row.frameScale));
-        EXPECT_EQ(RecordText(row.motion.Record()), row.record);
+        SCOPED_TRACE(name + record);
+        EXPECT_FALSE(motion.Save(htr.folder.Path(name), frameScale));
+        EXPECT_EQ(RecordText(motion.Record()), record);
         for (const char* extension : {".htr", ".bvh", ".tmp", ""})
         {
             const size_t own = std::string_view(extension) == ".htr" ? 1 : 0;
@@ -127,24 +112,18 @@ std::string Arms(const std::string& left, const std::string& right)
 
 TEST(CMotionFile, NamesWhatIsNoTPose)
 {
-    const struct
-    {
-        const char* what;
-        const char* left;
-        const char* right;
-        bool warns;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, bool> rows[] = {
         {"both sideways", "5 0 0", "-5 0 0", false},        {"a little down", "5 0 -2", "-5 0 -2", false},
         {"half way down", "5 0 -5", "-5 0 -5", true},       {"hanging", "0 0 -5", "0 0 -5", true},
         {"one of them hanging", "5 0 0", "0 0 -5", true},   {"crossed", "-5 0 0", "5 0 0", true},
         {"arms without a length", "0 0 0", "0 0 0", false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, left, right, warns] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const CLoadedMotion file(Arms(row.left, row.right), "a.bvh");
+        SCOPED_TRACE(what);
+        const CLoadedMotion file(Arms(left, right), "a.bvh");
         EXPECT_TRUE(file.loaded);
-        EXPECT_EQ(RecordText(file.motion.Record()), row.warns ? "RestPose 0 LeftArm\n" : "");
+        EXPECT_EQ(RecordText(file.motion.Record()), warns ? "RestPose 0 LeftArm\n" : "");
     }
 }
 

@@ -5,8 +5,8 @@
 #include "Paths.h"
 #include "Skeleton.h"
 
-#include <cstdlib>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -73,25 +73,20 @@ TEST(RealMotions, LoadOrAreRefusedForTheirOddity)
 
 TEST(RealMotions, OfMatricesStandAsAnIndependentReadingHasThem)
 {
-    const struct
-    {
-        const char* name;
-        const char* extension;
-        int frame;
-    } rows[] = {
+    const std::tuple<const char*, const char*, int> rows[] = {
         {"plain-text", ".cha", 20}, {"remarks", ".cha", 18},      {"short-row", ".cha", 16},
         {"open-header", ".cha", 5}, {"plain-binary", ".chb", 13}, {"begin", ".chb", 6},
         {"roots", ".chb", 13},      {"hundred", ".chb", 4},
     };
-    for (const auto& row : rows)
+    for (const auto& [name, extension, frame] : rows)
     {
-        SCOPED_TRACE(row.name);
-        const std::string path = SharedDataFolder() + "motions/" + row.name;
-        if (!FileExists(path + row.extension))
+        SCOPED_TRACE(name);
+        const std::string path = SharedDataFolder() + "motions/" + name;
+        if (!FileExists(path + extension))
             GTEST_SKIP() << "no shared data here";
         CMotionFile motion;
-        ASSERT_TRUE(motion.Load(path + row.extension));
-        ExpectPoses(motion, row.frame, ReadBytes(path + ".pose.json"), 1e-4);
+        ASSERT_TRUE(motion.Load(path + extension));
+        ExpectPoses(motion, frame, ReadBytes(path + ".pose.json"), 1e-4);
     }
 }
 

@@ -322,27 +322,22 @@ TEST_F(CRetargeterTest, WithoutAResetTheRootStandsOnTheGroundBesideTheRootPositi
 
 TEST_F(CRetargeterTest, TracksHaveAKeyForEveryFrameThroughTheLast)
 {
-    const struct
-    {
-        const char* what;
-        float last;
-        size_t keys;
-    } rows[] = {
+    const std::tuple<const char*, float, size_t> rows[] = {
         {"ten frames", 9.0f, 10},        {"the last one counts only when it is reached", 4.5f, 5},
         {"one frame", 0.0f, 1},          {"none below 0", -1.0f, 0},
         {"no number", std::nanf(""), 0},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, last, keys] : rows)
     {
-        SCOPED_TRACE(row.what);
-        ASSERT_TRUE(Run(true, row.last));
+        SCOPED_TRACE(what);
+        ASSERT_TRUE(Run(true, last));
         for (CNode* node : NodesOf(*m_kTarget))
         {
             const CKeyframeControl& track = TrackOf(*node);
-            EXPECT_EQ(track.m_kKeyTimes.size(), row.keys);
-            EXPECT_EQ(track.m_kRotationKeys.size(), row.keys);
-            EXPECT_EQ(track.m_kPositionKeys.size(), row.keys);
-            EXPECT_EQ(track.m_kScaleKeys.size(), row.keys);
+            EXPECT_EQ(track.m_kKeyTimes.size(), keys);
+            EXPECT_EQ(track.m_kRotationKeys.size(), keys);
+            EXPECT_EQ(track.m_kPositionKeys.size(), keys);
+            EXPECT_EQ(track.m_kScaleKeys.size(), keys);
             EXPECT_EQ(node->GetControl()->GetNext(), nullptr) << "tracks of an earlier run";
         }
     }

@@ -65,10 +65,7 @@ TEST(CTextLines, EndsLinesAndCutsLongOnes)
         {"three pieces", full + full + "y\r\nb", {"1:4095", "1:4095", "1:y", "2:b"}},
     };
     for (const auto& row : rows)
-    {
-        SCOPED_TRACE(row.what);
-        EXPECT_THAT(COpenText(row.text).All(), ElementsAreArray(row.pieces));
-    }
+        EXPECT_THAT(COpenText(row.text).All(), ElementsAreArray(row.pieces)) << row.what;
 }
 
 TEST(CTextLines, StepsBackOverOneReadAndTakesRowsWhole)

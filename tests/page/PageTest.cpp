@@ -12,7 +12,6 @@
 #include <regex>
 
 namespace gw {
-
 namespace {
 
 constexpr int kFrames = 40;

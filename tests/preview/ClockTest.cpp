@@ -69,18 +69,6 @@ TEST(Clock, StandsWhereEachOperationLeavesIt)
     }
 }
 
-TEST(Clock, PlaysEachFrameOnceAndStops)
-{
-    const Ref<CNode> scene = MakeScene({});
-    const CTimeKeeper& keeper = AttachKeeper(*scene);
-    CGLView view;
-    view.SetScene(scene.Get(), kStep, kLastFrame);
-    view.Play();
-    for (int tick = 0; tick < 10; ++tick)
-        view.Advance();
-    EXPECT_EQ(keeper.m_kTimes, (std::vector<float>{0.5f, 1.0f, 1.5f, 0.0f}));
-}
-
 TEST(Clock, ScrollBarWithoutARangeIsNoPlace)
 {
     const Ref<CNode> scene = MakeScene({});

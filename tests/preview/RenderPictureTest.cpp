@@ -3,11 +3,8 @@
 #include "RenderPicture.h"
 #include "Pixels.h"
 #include "PreviewScene.h"
-#include "TempFolder.h"
-#include "WritePng.h"
 
 #include <gtest/gtest.h>
-#include <png.h>
 #include <tuple>
 
 namespace gw {
@@ -104,66 +101,6 @@ TEST(RenderPicture, GivesEachPoseItsPart)
         EXPECT_EQ(CountColor(picture, missing, area), 0);
         EXPECT_EQ(CountColor(picture, {0, 0, 0}, area), 0) << "a part that was not drawn";
     }
-}
-
-TEST(RenderPicture, RefusesWhatHasNoPixels)
-{
-    const std::tuple<const char*, size_t, int, int, int> rows[] = {
-        {"no motion", 0, 10, 10, 1},
-        {"no width", 1, 0, 10, 1},
-        {"a height below 0", 1, 10, -10, 1},
-        {"too wide", 1, kLongestSide + 1, 10, 1},
-        {"too high", 1, 10, 1 << 30, 1},
-        {"no pose", 1, 10, 10, 0},
-        {"more poses than pixels", 1, 10, 10, 11},
-        {"more motions than rows", 3, 10, 2, 2},
-    };
-    for (const auto& [what, motions, width, height, poses] : rows)
-    {
-        SCOPED_TRACE(what);
-        PictureOptions options;
-        options.motions.resize(motions);
-        options.width = width;
-        options.height = height;
-        options.poseCount = poses;
-        RgbPicture picture;
-        EXPECT_EQ(RenderPicture(options, picture), EPictureAnswer::BadSize);
-    }
-}
-
-RgbPicture SmallPicture()
-{
-    RgbPicture picture(3, 2);
-    uint8_t value = 0;
-    for (uint8_t& byte : picture.rgb)
-        byte = value = static_cast<uint8_t>(value + 13);
-    return picture;
-}
-
-TEST(WritePng, PictureComesBack)
-{
-    const CTempFolder folder;
-    const RgbPicture picture = SmallPicture();
-    ASSERT_TRUE(WritePng(folder.Path("picture.png"), picture));
-    const std::string bytes = ReadBytes(folder.Path("picture.png"));
-    png_image image{};
-    image.version = PNG_IMAGE_VERSION;
-    ASSERT_TRUE(png_image_begin_read_from_memory(&image, bytes.data(), bytes.size()));
-    image.format = PNG_FORMAT_RGB;
-    std::vector<uint8_t> read(PNG_IMAGE_SIZE(image));
-    ASSERT_TRUE(png_image_finish_read(&image, nullptr, read.data(), 0, nullptr));
-    EXPECT_EQ(image.width, 3u);
-    EXPECT_EQ(read, picture.rgb);
-}
-
-TEST(WritePng, FailureKeepsTheOldFile)
-{
-    const CTempFolder folder;
-    const std::string path = folder.Path("picture.png");
-    WriteBytes(path, "old");
-    EXPECT_FALSE(WritePng(path, RgbPicture()));
-    EXPECT_FALSE(WritePng(folder.Path("no folder/picture.png"), SmallPicture()));
-    EXPECT_EQ(ReadBytes(path), "old");
 }
 
 } // namespace

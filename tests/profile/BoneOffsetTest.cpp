@@ -1,5 +1,4 @@
 // The rules of the dialog that edits one row.
-#include "ProfileFixture.h"
 
 #include <gmock/gmock.h>
 #include <tuple>

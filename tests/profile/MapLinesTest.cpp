@@ -7,7 +7,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 std::string Describe(const MapLine& line)

@@ -8,7 +8,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 // A line as "12 source>target 1,2,3 4,5,6", "12 rate 30" or "12 at 1,2,3", with its number in the file.

@@ -115,17 +115,6 @@ TEST_F(ProfileUndo, MarkersGoWithTheRows)
     EXPECT_EQ(Marked(), "B | LowerTorso ");
 }
 
-TEST_F(ProfileUndo, ButtonsAndSelectionFollow)
-{
-    Load("N\nA x Waist 0\nB x Head 0\n");
-    Remove(1);
-    EXPECT_TRUE(m_kEditor.Buttons().saveProfile);
-    m_kEditor.Undo();
-    EXPECT_FALSE(m_kEditor.Buttons().saveProfile);
-    EXPECT_TRUE(m_kEditor.Rows().IsSelected(1)) << "the row is back as it was";
-    EXPECT_TRUE(m_kEditor.Buttons().remove);
-}
-
 TEST_F(ProfileUndo, ANewCommandEndsTheRedo)
 {
     Load("N\nFrameRate 30\n");

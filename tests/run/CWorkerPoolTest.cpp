@@ -12,7 +12,6 @@
 #include <unistd.h>
 
 namespace gw {
-
 namespace {
 
 using EKind = JobEnd::EKind;

@@ -12,7 +12,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 void WriteText(const std::string& path, std::string_view text)
@@ -150,10 +149,7 @@ TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
          "[>                       ] 0/1000000  0.0/s  277777h46m left"},
     };
     for (const auto& [what, progress, width, line] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(ProgressLine(progress, width), line);
-    }
+        EXPECT_EQ(ProgressLine(progress, width), line) << what;
 }
 
 } // namespace gw

@@ -13,7 +13,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 std::vector<std::byte> SampleBytes()
@@ -291,12 +290,7 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
     written.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8).Root().Node(1, {}, "cut");
     EXPECT_EQ(SaveBytes(stream), written.Bytes());
 
-    const struct
-    {
-        const char* what;
-        uint32_t width, height, format, presence;
-        bool whole;
-    } rows[] = {
+    const std::tuple<const char*, uint32_t, uint32_t, uint32_t, uint32_t, bool> rows[] = {
         {"a size without pixels", 10, 10, 0, 0, true},
         {"no width", 0, 9, 0, 1, true},
         {"no height", 9, 0, 0, 1, true},
@@ -305,15 +299,15 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
         {"more than there is", 99, 99, 5, 1, false},
         {"a product of 34 bits", 65536, 65536, 0, 1, false},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, width, height, format, presence, whole] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         CSceneBytes odd;
-        odd.Text("").Words({row.width, row.height, row.format});
-        odd.Add<uint16_t>(0).Words({96, 96, row.presence, 1, 0}).Byte(0).Word(0).Root().Node(1);
+        odd.Text("").Words({width, height, format});
+        odd.Add<uint16_t>(0).Words({96, 96, presence, 1, 0}).Byte(0).Word(0).Root().Node(1);
         COrrinStream loaded;
-        EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), row.whole);
-        EXPECT_EQ(loaded.GetRootCount(), row.whole ? 1u : 0u);
+        EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), whole);
+        EXPECT_EQ(loaded.GetRootCount(), whole ? 1u : 0u);
         EXPECT_TRUE(loaded.Thumbnail().m_kPixels.empty());
         EXPECT_TRUE(loaded.LoadThumbnailOnly(bytes.Bytes(), 0));
         EXPECT_EQ(loaded.Thumbnail().m_kPixels.size(), 16u) << "after a failure too";

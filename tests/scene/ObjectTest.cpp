@@ -139,10 +139,7 @@ TEST(CObject, SearchGoesThroughAttachmentsBeforeChildrenAndTheFirstHitWins)
         {"no name is not an empty name", "", nullptr, false, nullptr},
     };
     for (const auto& [what, name, record, derived, found] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_EQ(root->FindObject(name, record, derived), found);
-    }
+        EXPECT_EQ(root->FindObject(name, record, derived), found) << what;
     std::vector<CObject*> found;
     root->FindObjects(found, nullptr, &CNode::ms_kRTTI, false);
     EXPECT_EQ(found, (std::vector<CObject*>{root.Get(), leg, twin}));

@@ -6,7 +6,6 @@
 #include "CLightControl.h"
 
 namespace gw {
-
 namespace {
 
 void FillTrack(CKeyframeControl& track)

@@ -7,7 +7,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 Mat4 At(float x, float y, float z)

@@ -11,7 +11,6 @@
 #include <tuple>
 
 namespace gw {
-
 namespace {
 
 constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
@@ -160,26 +159,20 @@ TEST(FindKeys, AnyOrderOfPlayFindsTheSameSpan)
 TEST(FindKeys, OnTheKeyWhereTheCursorStandsThereIsNoFraction)
 {
     const std::vector<float> times = {0, 1, 2, 4};
-    const struct
-    {
-        const char* what;
-        float time;
-        uint32_t cursorBefore, a, b, cursorAfter;
-        float fraction;
-    } rows[] = {
+    const std::tuple<const char*, float, uint32_t, uint32_t, uint32_t, uint32_t, float> rows[] = {
         {"on the cursor's key", 1, 1, 1, 1, 1, 0}, {"forward onto a key", 2, 0, 2, 3, 2, 0},
         {"backward onto a key", 1, 2, 0, 1, 1, 1}, {"at the first", 0, 2, 0, 0, 0, 0},
         {"at the last", 4, 0, 3, 3, 3, 0},         {"a cursor beyond the axis", 1, 99, 0, 1, 1, 1},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, time, cursorBefore, a, b, cursorAfter, fraction] : rows)
     {
-        SCOPED_TRACE(row.what);
-        KeyCursor cursor = row.cursorBefore;
-        const auto span = FindKeys(row.time, times, cursor);
-        EXPECT_EQ(span.a, row.a);
-        EXPECT_EQ(span.b, row.b);
-        EXPECT_EQ(span.fraction, row.fraction);
-        EXPECT_EQ(cursor, row.cursorAfter);
+        SCOPED_TRACE(what);
+        KeyCursor cursor = cursorBefore;
+        const auto span = FindKeys(time, times, cursor);
+        EXPECT_EQ(span.a, a);
+        EXPECT_EQ(span.b, b);
+        EXPECT_EQ(span.fraction, fraction);
+        EXPECT_EQ(cursor, cursorAfter);
     }
     KeyCursor cursor = 0;
     EXPECT_EQ(FindKeys(0.0f, {-kInfinity, 1.0f}, cursor).fraction, 0.0f) << "nor on a way without end";
@@ -396,10 +389,7 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
         {"no number", kNaN, 3},
     };
     for (const auto& [what, time, keyTime] : rows)
-    {
-        SCOPED_TRACE(what);
-        EXPECT_NEAR(control->ClipTime(time), keyTime, 1e-5f);
-    }
+        EXPECT_NEAR(control->ClipTime(time), keyTime, 1e-5f) << what;
 }
 
 TEST(CKeyframeClipControl, OddClipsComeToAnEnd)

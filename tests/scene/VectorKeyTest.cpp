@@ -8,7 +8,6 @@
 #include <gtest/gtest.h>
 
 namespace gw {
-
 namespace {
 
 void FillKeys(CVectorKeyControl& control)

@@ -6,7 +6,6 @@
 #include <cmath>
 
 namespace gw {
-
 namespace {
 
 // Distances and not scalar products: an arc cosine near 1 loses half of the digits.

@@ -8,7 +8,6 @@
 #include <cmath>
 
 namespace gw {
-
 namespace {
 
 constexpr Mat3 kZUp{{1, 0, 0, 0, 0, 1, 0, -1, 0}};

@@ -6,7 +6,6 @@
 #include "Skeleton.h"
 
 namespace gw {
-
 namespace {
 
 constexpr MadeBone kPerson[] = {
