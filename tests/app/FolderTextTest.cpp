@@ -4,18 +4,15 @@
 #include "FileFilter.h"
 
 #include <gmock/gmock.h>
+#include <tuple>
 
 namespace gw {
 namespace {
 
 TEST(FolderText, NamesAFolderByBothSeparators)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* folder; // null for none
-    } rows[] = {
+    // place: null for none
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"nothing is the open folder", "", "/home/ann/"},
         {"the open folder itself", "/home/ann", "/home/ann/"},
         {"a separator at the end goes and comes", "/takes/", "/takes/"},
@@ -29,11 +26,11 @@ TEST(FolderText, NamesAFolderByBothSeparators)
         {"one of each", "/takes/\\day", nullptr},
         {"only the two", "\\\\", nullptr},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, place] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const std::optional<std::string> folder = FolderOfText(row.text, "/home/ann");
-        EXPECT_EQ(folder.value_or("none"), row.folder ? row.folder : "none");
+        SCOPED_TRACE(what);
+        const std::optional<std::string> folder = FolderOfText(text, "/home/ann");
+        EXPECT_EQ(folder.value_or("none"), place ? place : "none");
     }
     EXPECT_EQ(FolderOfText("takes", "/"), "/takes/");
 }

@@ -17,12 +17,8 @@ namespace gw {
 
 TEST(IniText, Values)
 {
-    const struct
-    {
-        const char* what;
-        const char* text;
-        const char* value; // of Settings/Window Pos; null when there is none
-    } rows[] = {
+    // held: of Settings/Window Pos; null when there is none
+    const std::tuple<const char*, const char*, const char*> rows[] = {
         {"plain", "[Settings]\nWindow%20Pos=a b\n", "a b"},
         {"no file", "", nullptr},
         {"another section", "[Other]\nWindow%20Pos=a\n", nullptr},
@@ -42,11 +38,11 @@ TEST(IniText, Values)
         {"no value", "[Settings]\nWindow%20Pos=\n", ""},
         {"cut short", "[Settings]\nWindow%20Pos=\"a\\", "a"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, text, held] : rows)
     {
-        const auto value = FindIniValue(row.text, "Settings", "Window Pos");
-        EXPECT_EQ(value.has_value(), row.value != nullptr) << row.what;
-        EXPECT_EQ(value.value_or(""), row.value ? row.value : "") << row.what;
+        const auto value = FindIniValue(text, "Settings", "Window Pos");
+        EXPECT_EQ(value.has_value(), held != nullptr) << what;
+        EXPECT_EQ(value.value_or(""), held ? held : "") << what;
     }
 }
 

@@ -44,32 +44,28 @@ TEST_F(ContentTest, APackageHoldsTheMotionAtFourTimesItsFrames)
 
 TEST_F(ContentTest, FilesAfterASave)
 {
-    const struct
-    {
-        const char* what;
-        const char* name;
-        std::vector<std::string> files; // in the folder afterwards
-    } rows[] = {
+    // kept: in the folder afterwards
+    const std::tuple<const char*, const char*, std::vector<std::string>> rows[] = {
         {"a package leaves no HTR", "a.Kinetra", {"a.Kinetra"}},
         {"any other extension gives an HTR", "b.mot", {"b.htr"}},
         {"an HTR", "c.htr", {"c.htr"}},
         {"no extension", "d", {"d.htr"}},
     };
     OpenAndConvert();
-    for (const auto& row : rows)
+    for (const auto& [what, name, kept] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const std::string folder = std::string("saved-") + row.name + '/';
+        SCOPED_TRACE(what);
+        const std::string folder = std::string("saved-") + name + '/';
         CreateFolder(m_kFolder.Path(folder));
-        SaveAs(folder + row.name);
+        SaveAs(folder + name);
         std::vector<std::string> files;
         for (const char* extension : {".Kinetra", ".htr", ".mot", ".tmp", ""})
         {
             for (const std::string& file : FilesInFolder(m_kFolder.Path(folder), extension))
                 files.push_back(file);
         }
-        EXPECT_EQ(files, row.files);
-        EXPECT_EQ(m_kWindow.TakeCalls().back(), "show " + m_kFolder.Path(folder + row.name));
+        EXPECT_EQ(files, kept);
+        EXPECT_EQ(m_kWindow.TakeCalls().back(), "show " + m_kFolder.Path(folder + name));
         EXPECT_TRUE(m_kContent.IsSaved());
     }
 }

@@ -42,13 +42,8 @@ bool Find(const std::string& file, uint32_t id, uint32_t locale, std::string& te
 TEST(StringLibrary, StringsByIdAndLanguage)
 {
     const std::string file = Library();
-    const struct
-    {
-        const char* what;
-        uint32_t id;
-        uint32_t locale;
-        const char* text; // empty when none is found
-    } rows[] = {
+    // words: empty when none is found
+    const std::tuple<const char*, uint32_t, uint32_t, const char*> rows[] = {
         {"the locale's own", 138, kGerman, "Ungültige Datei. \xe2\x82\xac"},
         {"another of the same language", 138, kAustrian, "Ungültige Datei. \xe2\x82\xac"},
         {"neutral before a foreign one", 144, kGerman, "Neutral"},
@@ -56,11 +51,11 @@ TEST(StringLibrary, StringsByIdAndLanguage)
         {"an empty place in a block", 140, kGerman, ""},
         {"a block that is not there", 9999, kGerman, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, id, locale, words] : rows)
     {
         std::string text;
-        EXPECT_EQ(Find(file, row.id, row.locale, text), *row.text != '\0') << row.what;
-        EXPECT_EQ(text, row.text) << row.what;
+        EXPECT_EQ(Find(file, id, locale, text), *words != '\0') << what;
+        EXPECT_EQ(text, words) << what;
     }
 }
 
@@ -99,14 +94,7 @@ TEST(ResourceManager, AStarLeavesATextToTheProgram)
     CResourceManager translated, plain;
     translated.OpenLibrary(folder.Path("res.dll"), kGerman);
     plain.OpenLibrary(folder.Path("none.dll"), kGerman);
-    const struct
-    {
-        const char* what;
-        const CResourceManager& manager;
-        int id;
-        bool found;
-        const char* text;
-    } rows[] = {
+    const std::tuple<const char*, const CResourceManager&, int, bool, const char*> rows[] = {
         {"translated", translated, 138, true, "Ungültige Datei. \xe2\x82\xac"},
         {"a star", translated, 139, true, "Save convertion result?"},
         {"not in the library", translated, 137, true, "Unable to locate Kestro."},
@@ -115,11 +103,11 @@ TEST(ResourceManager, AStarLeavesATextToTheProgram)
         {"no library", plain, 138, true, "Invalid BVH file format."},
         {"no such message", plain, -5, false, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, manager, id, found, words] : rows)
     {
         std::string text;
-        EXPECT_EQ(row.manager.LoadResString(row.id, text), row.found) << row.what;
-        EXPECT_EQ(text, row.text) << row.what;
+        EXPECT_EQ(manager.LoadResString(id, text), found) << what;
+        EXPECT_EQ(text, words) << what;
     }
 }
 

@@ -110,16 +110,10 @@ TEST_F(ToolTest, ASelectedMappingSelectsItsBones)
 
 TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
 {
-    const auto setNumbers = [](MapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
-    const auto setRate = [](MapLine& line) { line.frameRate = 25; };
-    const auto setText = [](MapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
-    const struct
-    {
-        const char* what;
-        int line;
-        std::function<void(MapLine&)> edit;
-        const char* text;
-    } rows[] = {
+    const auto setNumbers = [](CMapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
+    const auto setRate = [](CMapLine& line) { line.frameRate = 25; };
+    const auto setText = [](CMapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
+    const std::tuple<const char*, int, std::function<void(CMapLine&)>, const char*> rows[] = {
         {"a text, cut", 0, setText, "\u00c4 name of more than thirty-two c"},
         {"the position", 1, setNumbers, "Position 1,-2,720"},
         {"the frame rate", 2, setRate, "FrameRate 25"},
@@ -128,18 +122,18 @@ TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
     };
     LoadSource();
     LoadMap(kMap);
-    for (const auto& row : rows)
+    for (const auto& [what, original, edit, text] : rows)
     {
-        SCOPED_TRACE(row.what);
-        m_kTool.SelectLine(row.line);
-        m_kToolWindow.onEdit = nullptr;
+        SCOPED_TRACE(what);
+        m_kTool.SelectLine(original);
+        m_kToolWindow.m_kOnEdit = nullptr;
         const std::string before = m_kTool.Map().SelectedLine()->text;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().SelectedLine()->text, before) << "cancelled";
-        m_kToolWindow.onEdit = row.edit;
+        m_kToolWindow.m_kOnEdit = edit;
         Click(kToolDetail);
-        EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(row.line)].text, row.text);
-        EXPECT_EQ(m_kTool.Map().Selected(), row.line);
+        EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(original)].text, text);
+        EXPECT_EQ(m_kTool.Map().Selected(), original);
     }
     EXPECT_EQ(m_kTool.Map().RootPosition(), (Vec3{1, -2, 720}));
     EXPECT_EQ(m_kTool.Map().FrameRate(), 25);

@@ -10,6 +10,7 @@
 #include <iterator>
 #include <limits>
 #include <random>
+#include <tuple>
 #include <vector>
 
 namespace gw {
@@ -186,12 +187,7 @@ TEST(Numbers, RandomTextsReadAsTheLibraryReadsThem)
 
 TEST(Numbers, IntegersReadAsTheLibraryReadsThemAndStopAtTheEnds)
 {
-    const struct
-    {
-        const char* text;
-        bool scanned;
-        int32_t value;
-    } rows[] = {
+    const std::tuple<const char*, bool, int32_t> rows[] = {
         {"12", true, 12},
         {" \t\r\n+12x", true, 12},
         {"-12.9", true, -12},
@@ -205,16 +201,16 @@ TEST(Numbers, IntegersReadAsTheLibraryReadsThemAndStopAtTheEnds)
         {"", false, 0},
         {"x", false, 0},
     };
-    for (const auto& row : rows)
+    for (const auto& [words, scanned, held] : rows)
     {
-        SCOPED_TRACE(row.text);
-        const CBlock block(row.text);
+        SCOPED_TRACE(words);
+        const CBlock block(words);
         int32_t value = -5;
-        EXPECT_EQ(ScanInt(block.Text(), value), row.scanned);
-        EXPECT_EQ(value, row.scanned ? row.value : -5);
-        EXPECT_EQ(ParseInt(block.Text()), row.value);
+        EXPECT_EQ(ScanInt(block.Text(), value), scanned);
+        EXPECT_EQ(value, scanned ? held : -5);
+        EXPECT_EQ(ParseInt(block.Text()), held);
         char text[kIntBytes];
-        EXPECT_EQ(std::string(text, WriteInt(text, row.value)), std::to_string(row.value));
+        EXPECT_EQ(std::string(text, WriteInt(text, held)), std::to_string(held));
     }
 }
 

@@ -62,23 +62,18 @@ protected:
 
 TEST_F(Choose, OfEqualRowsTheRestPoseDecides)
 {
-    const struct
-    {
-        const char* what;
-        BodyChange change;
-        const char* name;
-    } rows[] = {
+    const std::tuple<const char*, BodyChange, const char*> rows[] = {
         {"a hand of one bone", {"plain"}, "MotionBuilder / HumanIK (2 spine joints)"},
         {"a hand of fingers",
          {"fingers", "", BodyChange::AsTheyAre, true, true},
          "MotionBuilder / HumanIK (2 spine joints, fingers)"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, change, named] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const CNamedBody body(kHumanIK, row.change);
+        SCOPED_TRACE(what);
+        const CNamedBody body(kHumanIK, change);
         const std::vector<ProfileChoice> choices = Of(body.Root());
-        EXPECT_EQ(choices.front().profile.name, row.name);
+        EXPECT_EQ(choices.front().profile.name, named);
         EXPECT_EQ(choices.front().verdict.sureness, ESureness::Sure);
         EXPECT_LT(choices.front().verdict.turn, 5.0);
     }
@@ -162,13 +157,7 @@ TEST_F(Choose, TheSourceStandsAsItStoodBefore)
 TEST(SharedPrefix, NearlyAllNamesMustHaveIt)
 {
     const std::string body = "Hips Spine Neck Head LeftArm RightArm LeftLeg RightLeg ";
-    const struct
-    {
-        const char* what;
-        const char* prefix;
-        const char* others;
-        std::vector<std::string> prefixes;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, std::vector<std::string>> rows[] = {
         {"none", "", "", {}},
         {"an underscore", "Model_", "", {"Model_"}},
         {"a namespace in a namespace", "a:b:", "", {"a:b:", "a:"}},
@@ -176,17 +165,17 @@ TEST(SharedPrefix, NearlyAllNamesMustHaveIt)
         {"a root outside", "Model_", "Armature", {"Model_"}},
         {"many outside", "Model_", "Sword Shield Horse", {}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, prefix, siblings, prefixes] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         std::vector<std::string> names;
         std::istringstream words(body);
         for (std::string word; words >> word;)
-            names.push_back(row.prefix + word);
-        std::istringstream others(row.others);
+            names.push_back(prefix + word);
+        std::istringstream others(siblings);
         for (std::string word; others >> word;)
             names.push_back(word);
-        EXPECT_EQ(SharedPrefixes(names), row.prefixes);
+        EXPECT_EQ(SharedPrefixes(names), prefixes);
     }
     EXPECT_TRUE(SharedPrefixes(std::vector<std::string>{"a_b", "a_c"}).empty());
     EXPECT_TRUE(SharedPrefixes({}).empty());

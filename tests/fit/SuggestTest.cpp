@@ -14,6 +14,7 @@
 #include <gtest/gtest.h>
 #include <memory>
 #include <random>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -132,12 +133,7 @@ TEST(SuggestProfile, ATPoseThatLooksAlongZNeedsNoTurns)
 
 TEST(SuggestProfile, RowsGoWithWhatTheSkeletonHas)
 {
-    const struct
-    {
-        const char* recipe;
-        const char* target;
-        ESuggestedRow kind;
-    } rows[] = {
+    const std::tuple<const char*, const char*, ESuggestedRow> rows[] = {
         {"spine1", "Waist", ESuggestedRow::NoSource},
         {"spine2", "Waist", ESuggestedRow::Turned},
         {"neck0", "Neck", ESuggestedRow::NoSource},
@@ -149,13 +145,13 @@ TEST(SuggestProfile, RowsGoWithWhatTheSkeletonHas)
         {"nofeet walk", "LFoot", ESuggestedRow::NoSource},
     };
     const auto target = LoadTarget();
-    for (const auto& row : rows)
+    for (const auto& [recipe, bone, kind] : rows)
     {
-        const CMadeSkeleton made(row.recipe, 1);
+        const CMadeSkeleton made(recipe, 1);
         const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
-        EXPECT_EQ(RowOf(profile, row.target).kind, row.kind) << row.recipe << ", " << row.target;
-        const bool hasRow = profile.Table().FindTarget(row.target) != CMapRowTable::kNone;
-        EXPECT_EQ(hasRow, row.kind <= ESuggestedRow::Fixed) << row.recipe << ", " << row.target;
+        EXPECT_EQ(RowOf(profile, bone).kind, kind) << recipe << ", " << bone;
+        const bool hasRow = profile.Table().FindTarget(bone) != CMapRowTable::kNone;
+        EXPECT_EQ(hasRow, kind <= ESuggestedRow::Fixed) << recipe << ", " << bone;
     }
 }
 

@@ -7,6 +7,7 @@
 
 #include <cmath>
 #include <set>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -102,27 +103,21 @@ TEST(AttachBoneMeshes, ABoneReachesToItsChildAndALeafIsAStump)
     CNode* still = AddNode(*ankle, kVec3Zero);
     ASSERT_TRUE(AttachBoneMeshes(hip.Get()));
 
-    const struct
-    {
-        const char* what;
-        const CNode* node;
-        float length;
-        Vec3 along;
-    } rows[] = {
+    const std::tuple<const char*, const CNode*, float, Vec3> rows[] = {
         {"along z, whatever the sign of x", hip.Get(), 5.0f, kVec3UnitZ},
         {"along x", knee, 5.0f, kVec3UnitX},
         {"a child without offset leaves the length", ankle, 1.5f, kVec3UnitX},
         {"without offset of its own it stays empty", still, 0.0f, kVec3UnitY},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, node, length, way] : rows)
     {
-        SCOPED_TRACE(row.what);
-        CBoneMesh* mesh = FindBoneMesh(*row.node);
+        SCOPED_TRACE(what);
+        CBoneMesh* mesh = FindBoneMesh(*node);
         ASSERT_NE(mesh, nullptr);
         EXPECT_EQ(mesh->GetRTTI(), &CBoneShapeMesh::ms_kRTTI);
-        EXPECT_FLOAT_EQ(mesh->m_fLength, row.length);
+        EXPECT_FLOAT_EQ(mesh->m_fLength, length);
         const Vec3 along = TransformCoord(mesh->Axis(), mesh->m_kMatrix);
-        EXPECT_NEAR(Vec3Dot(along, row.along), 1.0, 1e-6);
+        EXPECT_NEAR(Vec3Dot(along, way), 1.0, 1e-6);
     }
     EXPECT_EQ(FindBoneMesh(*still)->GetTriangleQuantity(), 0);
 }

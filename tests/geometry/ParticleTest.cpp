@@ -1,6 +1,7 @@
 #include "ControlSamples.h"
 
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -33,18 +34,13 @@ struct System
 TEST(Particles, SlowRatesDoNotStarveAndTimeThatStandsDoesNothing)
 {
     System system(10, 0.5f);
-    const struct
-    {
-        const char* what;
-        float time;
-        int32_t active;
-    } rows[] = {
+    const std::tuple<const char*, float, int32_t> rows[] = {
         {"no time has gone", 0, 0}, {"half a particle", 1, 0},   {"a whole one", 2, 1},
         {"half again", 3, 1},       {"time stands still", 3, 1}, {"the second", 4, 2},
         {"time goes back", 1, 2},   {"and on from there", 3, 3},
     };
-    for (const auto& row : rows)
-        EXPECT_EQ(system.ActiveAt(row.time), row.active) << row.what;
+    for (const auto& [what, seconds, active] : rows)
+        EXPECT_EQ(system.ActiveAt(seconds), active) << what;
     system.control->m_bActive = false;
     EXPECT_EQ(system.ActiveAt(50.0f), 3);
 }

@@ -59,12 +59,7 @@ protected:
 
 TEST_F(Skin, WhatWeightsLackGoesToTheMeshAndTooMuchDividesThePoint)
 {
-    const struct
-    {
-        const char* what;
-        std::vector<Influence> influences;
-        Vec3 expected;
-    } rows[] = {
+    const std::tuple<const char*, std::vector<Influence>, Vec3> rows[] = {
         {"no bone", {}, {1, 10, 0}},
         {"weight 0", {{m_kA.Get(), 0}}, {1, 10, 0}},
         {"one bone", {{m_kA.Get(), 1}}, {101, 0, 0}},
@@ -72,14 +67,14 @@ TEST_F(Skin, WhatWeightsLackGoesToTheMeshAndTooMuchDividesThePoint)
         {"too much", {{m_kA.Get(), 1}, {m_kB.Get(), 1}}, {51, 0, 50}},
         {"below nothing", {{m_kA.Get(), -1}}, {-99, 20, 0}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, weights, expected] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         m_kMesh->DetachControls();
-        Attach<CBoneSkinControl>(row.influences);
+        Attach<CBoneSkinControl>(weights);
         const uint32_t stamp = m_kMesh->m_uiChangeStamp;
         Update();
-        ExpectPoint(Point(0), row.expected);
+        ExpectPoint(Point(0), expected);
         ExpectPoint(Point(1), {0, 10, 1});
         EXPECT_EQ(m_kMesh->m_uiChangeStamp, stamp + 1);
     }

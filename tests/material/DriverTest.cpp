@@ -365,19 +365,15 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
         drivers.append(driver.name).append(" ");
     EXPECT_EQ(drivers, "bmp gif ");
 
-    const struct
-    {
-        const char* name;
-        std::string_view driver;
-    } names[] = {
+    const std::tuple<const char*, std::string_view> names[] = {
         {"a.bmp", "bmp"},  {"-.bmp", "bmp"}, {"a.b.GIF", "gif"}, {"a.PJpeg", "jpg"},
         {"a.tiff", "tif"}, {"a.ppm", "pnm"}, {"a.Z", "rle"},     {"a", "none"},
         {"a.", "none"},    {"bmp", "none"},  {"a.txt", "none"},
     };
-    for (const auto& row : names)
+    for (const auto& [name, wanted] : names)
     {
-        const PicFileType* type = FindPictureType(row.name);
-        EXPECT_EQ(type ? type->driver : "none", row.driver) << row.name;
+        const PicFileType* type = FindPictureType(name);
+        EXPECT_EQ(type ? type->driver : "none", wanted) << name;
     }
     EXPECT_EQ(FindPictureType("a.Z")->magic, 0x1f9d);
     EXPECT_EQ(FindPictureType("a.z")->magic, 0x1f8b);

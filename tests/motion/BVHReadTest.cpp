@@ -213,11 +213,11 @@ TEST(TKBVHStream, ReadsManyFramesOfJointsWithoutChannels)
 // filled up.
 TEST(TKBVHStream, ValuesBehindAShortRowMoveUp)
 {
-    const std::string motion = "MOTION\nFrames: 3\nFrame Time: 1\n0 1 2\n0 3\n0 4 5\n";
-    const CLoadedMotion file("HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nCHANNELS 2 Xposition "
-                             "Yposition\n}\n}\n" +
-                                 motion,
-                             "a.bvh");
+    const CLoadedMotion file(
+        "HIERARCHY\nROOT R\n{\nCHANNELS 1 Xposition\nJOINT J\n{\nCHANNELS 2 Xposition Yposition\n"
+        "JOINT K\n{\nCHANNELS 1 Zposition\n}\n}\n}\nMOTION\nFrames: 3\nFrame Time: 1\n"
+        "0 1 2 9\n0 3\n0 4 5 9\n",
+        "a.bvh");
     ASSERT_TRUE(file.loaded);
     CNode* const joint = FindNode(file.motion.motionRoot.Get(), "J");
     const auto& keys = static_cast<CKeyframeControl*>(joint->GetControl())->m_kPositionKeys;

@@ -1,6 +1,7 @@
 // What a CHA file becomes, and what is refused.
 
 #include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "MotionTexts.h"
 #include "Skeleton.h"
@@ -186,11 +187,7 @@ std::string Segments(int count)
 
 TEST(TKCHAStream, RefusesWithReasonAndLine)
 {
-    const struct
-    {
-        Change change;
-        const char* record;
-    } rows[] = {
+    const std::tuple<Change, const char*> rows[] = {
         {{"no bytes", "", ""}, "MissingSection 0 [HIERARCHY]"},
         {{"other text", "", "HIERARCHY\n"}, "MissingSection 1 [HIERARCHY]"},
         {{"a blank line at the top", "[HEADER]", "\n[HEADER]"}, "BlankLine 1 [HIERARCHY]"},
@@ -218,13 +215,13 @@ TEST(TKCHAStream, RefusesWithReasonAndLine)
         {{"frames without end and rows", "EndFrame 2\nNumSegments 2\n", "EndFrame 2000000000\nNumSegments 2"},
          "OpenHeader"},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, recorded] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.cha");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.cha");
         EXPECT_FALSE(file.loaded);
         EXPECT_FALSE(file.motion.motionRoot);
-        std::string record = row.record;
+        std::string record = recorded;
         if (record.ends_with('*'))
             record.replace(record.size() - 1, 1, std::string(80, 'A'));
         const std::string found = RecordText(file.motion.Record());

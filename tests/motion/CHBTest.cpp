@@ -159,12 +159,7 @@ TEST(TKCHBStream, RefusesWithReasonAndByte)
 {
     const std::string plain = SmallCHB(0, 3);
     const float infinity = std::numeric_limits<float>::infinity();
-    const struct
-    {
-        const char* what;
-        std::string bytes;
-        const char* record;
-    } rows[] = {
+    const std::tuple<const char*, std::string, const char*> rows[] = {
         {"another file", "HIERARCHY", "BadHeader 0 [HEADER]"},
         {"version 722", Patched(plain, kIntOffsets[0], Bytes(722)), "BadVersion 25 722"},
         {"a begin before 0", Patched(plain, kIntOffsets[kBegin], Bytes(-1)), "BadCount 83 EndFrame"},
@@ -181,13 +176,13 @@ TEST(TKCHBStream, RefusesWithReasonAndByte)
         {"a name without an end", Patched(plain, kFirstName, std::string(256, 'A')), "BadName 347 *"},
         {"no root", Patched(plain, kFirstName + 2 * 260 + 11 + 256, Name("Head")), "NoRoot 2074 Global"},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, bytes, recorded] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const CLoadedMotion file(row.bytes, "a.chb");
+        SCOPED_TRACE(what);
+        const CLoadedMotion file(bytes, "a.chb");
         EXPECT_FALSE(file.loaded);
         EXPECT_FALSE(file.motion.motionRoot);
-        std::string record = row.record;
+        std::string record = recorded;
         if (record.ends_with('*'))
             record.replace(record.size() - 1, 1, std::string(80, 'A'));
         EXPECT_EQ(RecordText(file.motion.Record()), "failed " + record + "\n");

@@ -104,13 +104,7 @@ TEST(TKHTRStream, ReadsOddFilesAsTheyStand)
 {
     const std::string noRows = "MissingSection 17 Head\n";
     const char* const lostHead = "UnknownSegment 21 Head\nUnknownSegment 27 [Head]\n";
-    const struct
-    {
-        Change change;
-        const char* tree;
-        size_t headKeys;
-        std::string record;
-    } rows[] = {
+    const std::tuple<Change, const char*, size_t, std::string> rows[] = {
         {{"a segment not counted", "ments 2", "ments 1"}, "Torso", 0, "BadCount 17 NumSegments\n*"},
         {{"unknown parent", "Head Torso", "Head Body"}, "Torso", 0, "UnknownSegment 17 Body\n*"},
         {{"two roots", "Head Torso", "Head GLOBAL"}, "Torso", 0, ""},
@@ -130,18 +124,18 @@ TEST(TKHTRStream, ReadsOddFilesAsTheyStand)
         {{"two sections", "[Head]", "[Head]\n1 2\n[Head]"}, "Torso(Head)", 3, "ShortRow 28 Head\n"},
         {{"fewer frames than none", "Frames 2", "Frames -2"}, "Torso(Head)", 2, ""},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, tree, headKeys, recorded] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.htr");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.htr");
         ASSERT_TRUE(file.loaded);
-        std::string record = row.record;
+        std::string record = recorded;
         if (record.ends_with('*'))
             record.replace(record.size() - 1, 1, lostHead);
         EXPECT_EQ(RecordText(file.motion.Record()), record);
-        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()), row.tree);
+        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
         const bool hasHead = FindNode(file.motion.motionRoot.Get(), "Head") != nullptr;
-        EXPECT_EQ(hasHead ? TrackOf(file.motion, "Head").m_kRotationKeys.size() : 0, row.headKeys);
+        EXPECT_EQ(hasHead ? TrackOf(file.motion, "Head").m_kRotationKeys.size() : 0, headKeys);
     }
 }
 
@@ -176,11 +170,7 @@ TEST(TKHTRStream, RowsWithoutValuesRepeatTheRowAbove)
 
 TEST(TKHTRStream, RefusesWithReasonAndLine)
 {
-    const struct
-    {
-        Change change;
-        const char* record;
-    } rows[] = {
+    const std::tuple<Change, const char*> rows[] = {
         {{"no bytes", "", ""}, "MissingSection 0 [SegmentNames&Hierarchy]"},
         {{"other text", "", "HIERARCHY\n"}, "MissingSection 1 [SegmentNames&Hierarchy]"},
         {{"no segments counted", "ments 2", "ments 0"}, "NoRoot 30 NumSegments"},
@@ -197,13 +187,13 @@ TEST(TKHTRStream, RefusesWithReasonAndLine)
         {{"number too big for a float", "2 4 5 6", "2 4 1e39 6"}, "BadNumber 26 1e39"},
         {{"row that is no row", "2 4 5 6", "Torso 4 5 6"}, "BadNumber 26 Torso"},
     };
-    for (const auto& row : rows)
+    for (const auto& [change, recorded] : rows)
     {
-        SCOPED_TRACE(row.change.what);
-        const CLoadedMotion file(Changed(row.change), "a.htr");
+        SCOPED_TRACE(change.what);
+        const CLoadedMotion file(Changed(change), "a.htr");
         EXPECT_FALSE(file.loaded);
         const std::string record = RecordText(file.motion.Record());
-        EXPECT_EQ(record.substr(0, record.find('\n')), std::string("failed ") + row.record);
+        EXPECT_EQ(record.substr(0, record.find('\n')), std::string("failed ") + recorded);
     }
 }
 

@@ -8,6 +8,7 @@
 #include <cmath>
 #include <gtest/gtest.h>
 #include <numeric>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -93,27 +94,24 @@ TEST(SmoothCurve, KeepsPlaceAndSumOfAPeakAndTheEndsOfALine)
 TEST(YieldKnee, BentKneeReachesWhatIsAskedAndAStraightOneKeepsItsAngle)
 {
     const LegLengths leg{360.0, 345.0};
-    const struct
-    {
-        const char* what;
-        double angle;   // degrees
-        double more;    // asked beyond the own reach
-        double reached; // of that, at the least
-        double turned;  // degrees that the knee may turn
-    } rows[] = {
+    // degrees: degrees
+    // more: asked beyond the own reach
+    // reached: of that, at the least
+    // turned: degrees that the knee may turn
+    const std::tuple<const char*, double, double, double, double> rows[] = {
         {"bent, shorter", 60.0, -20.0, -19.0, 10.0},    {"bent, longer", 60.0, 20.0, 18.5, 10.0},
         {"straight, noise", 2.0, -0.3, 0.0, 1.0},       {"straight, longer", 2.0, 30.0, 0.0, 2.1},
         {"out of all reach", 90.0, 900.0, 150.0, 90.0},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, degrees, more, reached, turned] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const double angle = row.angle / 57.29578;
+        SCOPED_TRACE(what);
+        const double angle = degrees / 57.29578;
         const double own = ReachAt(leg, angle);
-        const double reach = YieldingReach(leg, own + row.more, angle, 25.0);
-        EXPECT_GE((reach - own) / row.more, row.reached / row.more);
-        EXPECT_LE(std::fabs(reach - own), std::fabs(row.more));
-        EXPECT_LE(std::fabs(AngleAt(leg, reach) - angle) * 57.29578, row.turned);
+        const double reach = YieldingReach(leg, own + more, angle, 25.0);
+        EXPECT_GE((reach - own) / more, reached / more);
+        EXPECT_LE(std::fabs(reach - own), std::fabs(more));
+        EXPECT_LE(std::fabs(AngleAt(leg, reach) - angle) * 57.29578, turned);
         EXPECT_LE(reach, 705.0);
     }
 }

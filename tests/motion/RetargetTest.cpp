@@ -155,12 +155,8 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
     const Mat3 about[] = {EulerToMat3("ZYX", {angles.x, 0, 0}), EulerToMat3("ZYX", {0, angles.y, 0}),
                           EulerToMat3("ZYX", {0, 0, angles.z})};
     const Mat3 forearm = codes * about[0] * about[1] * about[2];
-    const struct
-    {
-        const char* source;
-        const char* target;
-        const Mat3* offset; // stands left of the source's rotation: it acts first
-    } rows[] = {
+    // offset: stands left of the source's rotation: it acts first
+    const std::tuple<const char*, const char*, const Mat3*> rows[] = {
         {"Hips", "LowerTorso", &none},   {"LeftHip", "LThigh", &none},
         {"RightKnee", "RCalf", &none},   {"LeftAnkle", "LFoot", &none},
         {"Chest", "UpperTorso", &none},  {"LeftCollar", "LCollar", &none},
@@ -170,11 +166,11 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
     for (size_t frame = 0; frame < 10; ++frame)
     {
         Pose(frame);
-        for (const auto& row : rows)
+        for (const auto& [from, bone, offset] : rows)
         {
-            const Mat3 wanted = *row.offset * NormalizedRows(Source(row.source)->m_kWorldMatrix);
-            EXPECT_LT(DegreesBetween(Target(row.target)->m_kWorldMatrix, wanted), 0.05)
-                << row.target << " in frame " << frame;
+            const Mat3 wanted = *offset * NormalizedRows(Source(from)->m_kWorldMatrix);
+            EXPECT_LT(DegreesBetween(Target(bone)->m_kWorldMatrix, wanted), 0.05)
+                << bone << " in frame " << frame;
         }
     }
 }
@@ -391,13 +387,8 @@ TEST_F(CRetargeterTest, ASourceOfTwiceTheSizeHasHalfTheScale)
 
 TEST_F(CRetargeterTest, ShareFileLines)
 {
-    const struct
-    {
-        const char* what;
-        std::string line;
-        const char* bone; // null where none gets shares
-        BoneShares shares;
-    } rows[] = {
+    // bone: null where none gets shares
+    const std::tuple<const char*, std::string, const char*, CBoneShares> rows[] = {
         {"plain", "Waist Share 1 2 Type 0", "Waist", {1, 2, 0}},
         {"keywords without case, commas and colons", "SHARE: 3, 4, tYPE: 2, Neck", "Neck", {3, 4, 2}},
         {"type stays from the line before", "Type 2 Waist\nUpperTorso Share 1 5", "UpperTorso", {1, 5, 2}},
@@ -413,20 +404,20 @@ TEST_F(CRetargeterTest, ShareFileLines)
         {"windows line ends", "Waist Share 8 9 Type 1\r\n", "Waist", {8, 9, 1}},
     };
     const std::string path = ::testing::TempDir() + "shares.bsm";
-    for (const auto& row : rows)
+    for (const auto& [what, line, bone, weights] : rows)
     {
-        SCOPED_TRACE(row.what);
-        std::ofstream(path, std::ios::binary) << row.line;
+        SCOPED_TRACE(what);
+        std::ofstream(path, std::ios::binary) << line;
         CRetargeter retargeter;
         retargeter.SetScenes(m_kSource.Get(), m_kTarget.Get());
         ASSERT_TRUE(retargeter.LoadShares(path));
-        const BoneShares* shares = nullptr;
-        ASSERT_EQ(retargeter.Shares(Target(row.bone ? row.bone : "Neck"), shares), row.bone != nullptr);
-        if (!row.bone)
+        const CBoneShares* shares = nullptr;
+        ASSERT_EQ(retargeter.Shares(Target(bone ? bone : "Neck"), shares), bone != nullptr);
+        if (!bone)
             continue;
-        EXPECT_EQ(shares->m_fShare1, row.shares.m_fShare1);
-        EXPECT_EQ(shares->m_fShare2, row.shares.m_fShare2);
-        EXPECT_EQ(shares->m_fType, row.shares.m_fType);
+        EXPECT_EQ(shares->m_fShare1, weights.m_fShare1);
+        EXPECT_EQ(shares->m_fShare2, weights.m_fShare2);
+        EXPECT_EQ(shares->m_fType, weights.m_fType);
     }
     std::remove(path.c_str());
     EXPECT_FALSE(m_kRetargeter.LoadShares(path));

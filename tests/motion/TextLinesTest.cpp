@@ -3,6 +3,7 @@
 
 #include <gmock/gmock.h>
 #include <string>
+#include <tuple>
 #include <vector>
 
 namespace gw {
@@ -42,12 +43,7 @@ TEST(CTextLines, EndsLinesAndCutsLongOnes)
 {
     const std::string full(CTextLines::kPieceLength, 'x');
     const std::string shorter(CTextLines::kPieceLength - 1, 'x');
-    const struct
-    {
-        const char* what;
-        std::string text;
-        std::vector<std::string> pieces;
-    } rows[] = {
+    const std::tuple<const char*, std::string, std::vector<std::string>> rows[] = {
         {"no bytes", "", {}},
         {"line feeds", "a\n\nb\n", {"1:a", "2:", "3:b"}},
         {"carriage returns and line feeds, mixed", "a\r\n\r\nb\nc\r\n", {"1:a", "2:", "3:b", "4:c"}},
@@ -64,8 +60,8 @@ TEST(CTextLines, EndsLinesAndCutsLongOnes)
         {"carriage return at the cut", full + "\ry\nb", {"1:4095", "1:\ry", "2:b"}},
         {"three pieces", full + full + "y\r\nb", {"1:4095", "1:4095", "1:y", "2:b"}},
     };
-    for (const auto& row : rows)
-        EXPECT_THAT(COpenText(row.text).All(), ElementsAreArray(row.pieces)) << row.what;
+    for (const auto& [what, words, pieces] : rows)
+        EXPECT_THAT(COpenText(words).All(), ElementsAreArray(pieces)) << what;
 }
 
 TEST(CTextLines, StepsBackOverOneReadAndTakesRowsWhole)

@@ -5,6 +5,7 @@
 #include <cmath>
 #include <gtest/gtest.h>
 #include <limits>
+#include <tuple>
 
 namespace gw {
 
@@ -40,25 +41,19 @@ TEST(ThinCurve, TakesAShortCurveWholeAndLeavesOutWhatIsNoNumber)
 
 TEST(Axis, HoldsItsNumbersBetweenRoundOnes)
 {
-    const struct
-    {
-        const char* what;
-        double least;
-        double largest;
-        std::vector<double> ticks;
-    } rows[] = {
+    const std::tuple<const char*, double, double, std::vector<double>> rows[] = {
         {"degrees", 0.0, 47.0, {0.0, 20.0, 40.0, 60.0}},
         {"below and above", -13.0, 188.0, {-100.0, 0.0, 100.0, 200.0}},
         {"small", 0.0, 0.02, {0.0, 0.01, 0.02}},
         {"far from nothing", 901.0, 904.5, {900.0, 902.0, 904.0, 906.0}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, least, largest, marks] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const std::vector<double> ticks = CAxis(row.least, row.largest, 3).Ticks();
-        ASSERT_EQ(ticks.size(), row.ticks.size());
+        SCOPED_TRACE(what);
+        const std::vector<double> ticks = CAxis(least, largest, 3).Ticks();
+        ASSERT_EQ(ticks.size(), marks.size());
         for (size_t i = 0; i < ticks.size(); ++i)
-            EXPECT_NEAR(ticks[i], row.ticks[i], 1e-9);
+            EXPECT_NEAR(ticks[i], marks[i], 1e-9);
     }
     for (const double still : {0.0, 42.0, -1e30, 1e-30})
     {

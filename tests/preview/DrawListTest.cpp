@@ -125,16 +125,5 @@ TEST(DrawList, FollowsATreeThatChangesUnderIt)
     EXPECT_EQ(meshes(), 1u);
 }
 
-TEST(DrawList, KeepsItsMemoryFromFrameToFrame)
-{
-    const Ref<CNode> scene = MakeScene({});
-    AttachBone(*scene, "bone", 100);
-    CGLView view;
-    view.SetScene(scene.Get(), 1.0f, 1.0f);
-    const LineEnd* const ends = view.DrawScene().Ends().data();
-    view.StepForward();
-    EXPECT_EQ(view.DrawScene().Ends().data(), ends);
-}
-
 } // namespace
 } // namespace gw

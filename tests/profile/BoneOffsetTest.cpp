@@ -1,5 +1,7 @@
 // The rules of the dialog that edits one row.
 
+#include "ProfileFixture.h"
+
 #include <gmock/gmock.h>
 #include <tuple>
 
@@ -30,33 +32,26 @@ TEST(BoneOffsetDialog, RotationLimitsAreUneven)
 
 TEST(BoneOffsetDialog, ChosenAxisIsSwappedOutOfTheOtherBoxes)
 {
-    const struct
-    {
-        const char* what;
-        int axis;
-        const char* entry;
-        AxisCodes before;
-        AxisCodes after;
-    } rows[] = {
+    const std::tuple<const char*, int, const char*, AxisCodes, AxisCodes> rows[] = {
         {"Y box holds it", 0, "Y", {1, 2, 3}, {2, 1, 3}},
         {"reversed counts as held", 0, "-Z", {1, 2, 3}, {-3, 2, 1}},
         {"old sign goes along", 2, "X", {1, 2, -3}, {-3, 2, 1}},
         {"own axis reversed", 1, "-Y", {1, 2, 3}, {1, -2, 3}},
         {"both boxes hold it", 0, "Y", {1, 2, -2}, {2, 1, 1}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, axis, chosen, before, after] : rows)
     {
-        RowNumbers numbers;
-        numbers.axes = row.before;
+        CRowNumbers numbers;
+        numbers.axes = before;
         CBoneOffsetDialog dialog(numbers);
         const auto& entries = CBoneOffsetDialog::kAxisEntries;
-        const auto entry = std::find(entries.begin(), entries.end(), row.entry) - entries.begin();
-        dialog.ChooseAxis(row.axis, int(entry));
-        EXPECT_EQ(dialog.Numbers().axes, row.after) << row.what;
-        EXPECT_EQ(entries[size_t(dialog.AxisEntry(row.axis))], row.entry) << row.what;
-        dialog.ChooseAxis(row.axis, 6);
-        dialog.ChooseAxis(row.axis, -1);
-        EXPECT_EQ(dialog.Numbers().axes, row.after) << "no such entries";
+        const auto entry = std::find(entries.begin(), entries.end(), chosen) - entries.begin();
+        dialog.ChooseAxis(axis, int(entry));
+        EXPECT_EQ(dialog.Numbers().axes, after) << what;
+        EXPECT_EQ(entries[size_t(dialog.AxisEntry(axis))], chosen) << what;
+        dialog.ChooseAxis(axis, 6);
+        dialog.ChooseAxis(axis, -1);
+        EXPECT_EQ(dialog.Numbers().axes, after) << "no such entries";
     }
 }
 

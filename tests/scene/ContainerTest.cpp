@@ -59,31 +59,25 @@ TEST(COrrinStream, WritesWhatTheFormatSays)
 
 TEST(PackageMotion, EveryByteIsWhereItBelongs)
 {
-    const struct
-    {
-        const char* what;
-        const char* source;
-        const char* content;
-        uint32_t format;
-    } rows[] = {
+    const std::tuple<const char*, const char*, const char*, uint32_t> rows[] = {
         {"htr in capitals", "walk.HTR", "abc", 3},  {"cha", "walk.cha", "x", 1},  {"chb", "walk.chb", "y", 2},
         {"another ending", "walk.htr.bak", "z", 0}, {"empty", "none.htr", "", 3},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, source, inside, format] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const CTempFolder folder;
-        const std::string_view content = row.content;
+        const std::string_view content = inside;
         const uint32_t size = static_cast<uint32_t>(content.size());
-        WriteBytes(folder.Path(row.source), content);
+        WriteBytes(folder.Path(source), content);
         CFailureRecord record;
-        ASSERT_TRUE(PackageMotion(folder.Path(row.source), folder.Path("out"), 30.0f, 60.0f, record));
+        ASSERT_TRUE(PackageMotion(folder.Path(source), folder.Path("out"), 30.0f, 60.0f, record));
         EXPECT_FALSE(record.Failure());
 
         CSceneBytes bytes;
         bytes.Header().EmptyThumbnail().Root().Node(1).Root();
         bytes.Object("CRawData", 2, "MotionInfo").Text("It's me 3").Words({300, 0, 3, 16, 1});
-        bytes.Words({1, row.format}).Float(30).Float(60);
+        bytes.Words({1, format}).Float(30).Float(60);
         bytes.Object("CRawData", 3, "MotionFile").Text("It's me 3").Words({300, 0, 0, size});
         bytes.Word(size ? 1 : 0).Raw(content);
         EXPECT_EQ(bytes.Bytes().size(), 381 + content.size());

@@ -276,20 +276,15 @@ TEST(ParentMask, UndoesTheChosenPartsOfTheParentsKeyPose)
 {
     const Mat3 turn = Mat3FromAxisAngle(kVec3UnitY, 1.0f);
     const Mat4 own = Mat4Compose(Mat3FromAxisAngle(kVec3UnitX, 0.5f), {1, 2, 3}, {1, 2, 1});
-    const struct
-    {
-        const char* what;
-        uint32_t mask;
-        Mat3 turn; // what the child must undo
-        Vec3 scale;
-    } rows[] = {
+    // rotation: what the child must undo
+    const std::tuple<const char*, uint32_t, Mat3, Vec3> rows[] = {
         {"nothing", 0, kMat3Identity, kVec3One},        {"rotation", 0x38, turn, kVec3One},
         {"scale", 0x1c0, kMat3Identity, {2, 4, 8}},     {"scale along y", 0x80, kMat3Identity, {1, 4, 1}},
         {"rotation and scale", 0x1f8, turn, {2, 4, 8}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, mask, rotation, scale] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         const Ref<CNode> parent = TrackedNode({0});
         Track(*parent).m_kPositionKeys = Along({10}, {0, 20, 30});
         Track(*parent).m_kRotationKeys = {QuatFromMat3(turn)};
@@ -299,9 +294,9 @@ TEST(ParentMask, UndoesTheChosenPartsOfTheParentsKeyPose)
         Track(*child).m_kPositionKeys = {own.Translation()};
         Track(*child).m_kRotationKeys = {QuatFromMat3(NormalizedRows(own))};
         Track(*child).m_kScaleKeys = {RowLengths(own)};
-        Track(*child).m_uiParentMask = row.mask;
+        Track(*child).m_uiParentMask = mask;
         parent->UpdateScene(0.0f, false);
-        const Mat4 undone = Mat4Compose(row.turn, kVec3Zero, row.scale);
+        const Mat4 undone = Mat4Compose(rotation, kVec3Zero, scale);
         const Mat4 expected =
             Mat4Compose(NormalizedRows(own), kVec3Zero, RowLengths(own)) * Mat4InverseOrIdentity(undone);
         for (int i = 0; i < 12; ++i)
