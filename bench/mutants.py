@@ -63,13 +63,13 @@ def position(source, text, line):
 def passes(copy, tests, jobs):
     """Whether tests pass; None if they cannot be built."""
     script = tests.startswith("cli.")
-    target = "gaitwright" if script else tests + "_tests"
-    if not run(["ninja", "-j", str(jobs), "-C", "build/release", target], copy):
+    targets = ["gaitwright", "assets"] if script else [tests + "_tests"]
+    if not run(["ninja", "-j", str(jobs), "-C", "build/release", *targets], copy):
         return None
     if script:
         return run(["ctest", "--test-dir", "build/release", "--no-tests=error", "-R", "^%s_test$" % re.escape(tests)],
                    copy, SECONDS)
-    return run([copy / "build/release/bin" / target, "--gtest_fail_fast"], copy, SECONDS)
+    return run([copy / "build/release/bin" / targets[0], "--gtest_fail_fast"], copy, SECONDS)
 
 
 def outcome(copy, tests, name, text, fault, jobs):
