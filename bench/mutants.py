@@ -48,7 +48,7 @@ def prepare(copy):
         ready = run(["git", "checkout", "-q", "--force", "--detach", commit.strip()], copy)
     else:
         ready = run(["git", "worktree", "add", "-q", "--detach", str(copy), commit.strip()], ROOT)
-    if not ready or not run(["cmake", "--preset", "release"], copy):
+    if not ready or not run(["cmake", "--preset", "release", "-DGAITWRIGHT_UNITY=OFF"], copy):
         sys.exit("%s: no copy could be made here" % copy)
 
 
