@@ -70,13 +70,6 @@ class Batch(CliTest):
         self.assertEqual(len(made), 1)
         self.assertEqual(len(self.files()), 6)
 
-    def test_the_first_failure_ends_the_run_with_what_was_done(self):
-        self.write("takes/b.bvh", BROKEN)
-        result = self.with_assets("batch", "takes", "--job", "htr", "--json")
-        self.assertEqual((result.code, lines(result)[0]["finished"]), (FAILED, 1))
-        self.assert_words(result, ["b.bvh:", "Invalid BVH file format.", "1 BVH files"])
-        self.assertEqual([f for f in self.files() if f.endswith(".htr")], ["takes/a.htr"])
-
     def test_motion_files_become_containers_without_a_profile(self):
         self.succeed("convert", "takes/a.bvh", "-o", "takes/a.htr")
         self.assertEqual(self.run_program("batch", "takes", "--job", "orn").code, DONE)

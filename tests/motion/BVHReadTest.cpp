@@ -247,18 +247,5 @@ TEST(TKBVHStream, WarnsOfPositionsThatRepeatTheOffsets)
     }
 }
 
-TEST(TKBVHStream, EveryPrefixIsTakenOrRefused)
-{
-    const CTempFolder folder;
-    for (size_t length = 0; length <= kSmallBVH.size(); ++length)
-    {
-        CMotionFile motion;
-        WriteBytes(folder.Path("a.bvh"), kSmallBVH.substr(0, length));
-        const bool loaded = motion.Load(folder.Path("a.bvh"));
-        EXPECT_NE(loaded, static_cast<bool>(motion.Record().Failure())) << length << " bytes";
-        EXPECT_TRUE(!loaded || IsFinite(*motion.motionRoot)) << length << " bytes";
-    }
-}
-
 } // namespace
 } // namespace gw

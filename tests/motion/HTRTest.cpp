@@ -216,19 +216,6 @@ TEST(TKHTRStream, ValuesOfSegmentsThatComeLaterAreLost)
     EXPECT_EQ(RecordText(file.motion.Record()), "UnknownSegment 2 Torso\n");
 }
 
-TEST(TKHTRStream, EveryPrefixIsTakenOrRefused)
-{
-    const CTempFolder folder;
-    for (size_t length = 0; length <= kSmallHTR.size(); ++length)
-    {
-        CMotionFile motion;
-        WriteBytes(folder.Path("a.htr"), kSmallHTR.substr(0, length));
-        const bool loaded = motion.Load(folder.Path("a.htr"));
-        EXPECT_NE(loaded, static_cast<bool>(motion.Record().Failure())) << length << " bytes";
-        EXPECT_TRUE(!loaded || IsFinite(*motion.motionRoot)) << length << " bytes";
-    }
-}
-
 // Two frames of a root that moves and grows, and a child whose own translation does not reach the file.
 constexpr std::string_view kMoving = R"([Header]
 NumSegments 2

@@ -39,6 +39,22 @@ TEST(CMotionFile, ChoosesByTheExtension)
     }
 }
 
+TEST(CMotionFile, EveryPrefixIsTakenOrRefused)
+{
+    const CTempFolder folder;
+    for (const auto& [name, text] : {std::pair{"a.bvh", kSmallBVH}, {"a.htr", kSmallHTR}})
+    {
+        for (size_t length = 0; length <= text.size(); ++length)
+        {
+            CMotionFile motion;
+            WriteBytes(folder.Path(name), text.substr(0, length));
+            const bool loaded = motion.Load(folder.Path(name));
+            EXPECT_NE(loaded, static_cast<bool>(motion.Record().Failure())) << length << " bytes of " << name;
+            EXPECT_TRUE(!loaded || IsFinite(*motion.motionRoot)) << length << " bytes of " << name;
+        }
+    }
+}
+
 TEST(CMotionFile, KeepsItsTreesWhenALoadFails)
 {
     CLoadedMotion file(kSmallHTR, "a.htr");

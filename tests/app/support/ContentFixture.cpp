@@ -1,6 +1,7 @@
 #include "ContentFixture.h"
 
 #include "CKeyframeControl.h"
+#include "CMadeText.h"
 #include "COrrinStream.h"
 #include "Paths.h"
 #include "Text.h"
@@ -126,15 +127,6 @@ const SourceBones kMaxBones{"Bip01", "L_Thigh", "L_Calf", "L_Foot", "R_Thigh", "
 
 namespace {
 
-std::string Leg(const std::string& x, const std::string& thigh, const std::string& calf,
-                const std::string& foot)
-{
-    return "JOINT " + thigh + "\n{\nOFFSET " + x + " -4 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nJOINT " +
-           calf + "\n{\nOFFSET 0 -40 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nJOINT " + foot +
-           "\n{\nOFFSET 0 -38 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nEnd Site\n{\nOFFSET 0 -4 "
-           "12\n}\n}\n}\n}\n";
-}
-
 constexpr const char* kTargetBones[][2] = {
     {"LowerTorso", "GLOBAL"}, {"Waist", "LowerTorso"}, {"LPelvis", "LowerTorso"}, {"LThigh", "LPelvis"},
     {"LCalf", "LThigh"},      {"LFoot", "LCalf"},      {"RPelvis", "LowerTorso"}, {"RThigh", "RPelvis"},
@@ -167,23 +159,19 @@ std::string TargetText()
 
 std::string BvhText(const SourceBones& bones, int frameCount)
 {
-    std::string text =
-        "HIERARCHY\nROOT " + bones.hip +
-        "\n{\nOFFSET 0 0 0\nCHANNELS 6 Xposition Yposition Zposition Zrotation Xrotation Yrotation\n" +
-        Leg("9", bones.leftThigh, bones.leftCalf, bones.leftFoot) +
-        Leg("-9", bones.rightThigh, bones.rightCalf, bones.rightFoot) +
-        "}\nMOTION\nFrames: " + std::to_string(frameCount) + "\nFrame Time: 0.033334\n";
-    for (int frame = 0; frame < frameCount; ++frame)
-    {
-        const std::string n = std::to_string(5 * frame);
-        for (const std::string& value :
-             {std::string("0"), std::string("80"), n, std::string("0"), std::string("0"), n})
-            text.append(value).append(" ");
-        for (int joint = 0; joint < 6; ++joint)
-            text.append("0 ").append(joint % 2 == 0 ? "-" : "").append(n).append(" 0 ");
-        text += '\n';
-    }
-    return text;
+    const Vec3 toe{0.0f, -4.0f, 12.0f};
+    CMadeText text({{bones.hip, -1, kVec3Zero},
+                    {bones.leftThigh, 0, {9, -4, 0}},
+                    {bones.leftCalf, 1, {0, -40, 0}},
+                    {bones.leftFoot, 2, {0, -38, 0}, toe},
+                    {bones.rightThigh, 0, {-9, -4, 0}},
+                    {bones.rightCalf, 4, {0, -40, 0}},
+                    {bones.rightFoot, 5, {0, -38, 0}, toe}});
+    return text.Write(frameCount, 0.033334, [](size_t joint, int frame) {
+        const auto n = static_cast<float>(5 * frame);
+        return joint == 0 ? TextKey{{0, 80, n}, {0, n, 0}}
+                          : TextKey{kVec3Zero, {joint % 2 == 0 ? n : -n, 0, 0}};
+    });
 }
 
 std::string BoneMapText(const std::string& name, const SourceBones& bones)
