@@ -7,6 +7,7 @@
 #include "CProfileEditorDialog.h"
 #include "FindBone.h"
 #include "Paths.h"
+#include "SourceTiming.h"
 
 #include <algorithm>
 #include <filesystem>
@@ -93,6 +94,7 @@ TEST_F(ContentTest, OpeningTellsTheFolderAndReadsItBack)
     m_kWindow.openAnswer = std::nullopt;
     EXPECT_EQ(m_kContent.OpenSource(), 1) << "a cancelled dialog is no failure";
     Open(Write("deep/walk.bvh", BvhText(kPoserBones)));
+    EXPECT_EQ(SourceRateOf(m_kContent.SourceRoot()), 30) << "the nearest rate, which is above 29.999";
     m_kWindow.TakeCalls();
     m_kContent.OpenSource();
     EXPECT_EQ(m_kWindow.TakeCalls().front(), "open *.bvh in " + m_kFolder.Path("deep/"));

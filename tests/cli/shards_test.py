@@ -89,6 +89,11 @@ class Shards(CliTest):
             work[entry["shard"]] += entry["bytes"]
         self.assertLess(max(work) - min(work), 60_000, work)
         self.assertEqual(sum(work), 2_730_000)
+        for number in range(20):  # files that are nothing but work of their own
+            self.write("small/s%d.bvh" % number, "x" * (100_000 if number == 0 else 1))
+        self.succeed("plan", "small", "--shards", 2, "-o", "plan.jsonl", "--force")
+        beside = [json.loads(line)["shard"] for line in self.read("plan.jsonl").splitlines()[1:]]
+        self.assertGreater(beside.count(beside[0]), 3)
 
     def test_without_an_output_folder_results_lie_beside_their_sources(self):
         self.plan(shards=2)
