@@ -5,6 +5,7 @@
 #include "FindBody.h"
 #include "FindBodyByNames.h"
 #include "FindBodyByShape.h"
+#include "JointSteps.h"
 #include "Paths.h"
 #include "TempFolder.h"
 
@@ -147,6 +148,12 @@ void NameBody(const CBodyMap& body, const char* left, const char* right)
         leg.shin->SetName((name + "Leg").c_str());
         leg.foot->SetName((name + "Foot").c_str());
     }
+}
+
+TEST(JointSteps, PlacesApartAreMoreThanRounding)
+{
+    EXPECT_TRUE(ArePlacedApart({0, 900, 0}, {0, 900.01f, 0}));
+    EXPECT_FALSE(ArePlacedApart({0, 900, 0}, {0, 900.0005f, 0}));
 }
 
 TEST(BodyStance, VerdictsHaveTheirLimits)

@@ -127,6 +127,22 @@ TEST(FindBodyByNames, ABodyKeepsItsJointsWhateverIsDoneToItsNames)
     }
 }
 
+TEST(FindBodyByNames, APrefixMayStandBeforeHalfOfTheNames)
+{
+    const Ref<CNode> root = Tree(kBody);
+    bool every2nd = false;
+    for (CNode* node : NodesOf(*root))
+    {
+        every2nd = !every2nd;
+        if (every2nd)
+            node->SetName(("mixamorig" + std::string(node->NameView())).c_str());
+    }
+    const CBodyMap body = FindBodyByNames(*root);
+    std::string_view places = kPlaces;
+    for (const BodyPlace& place : BodyPlaces())
+        EXPECT_TRUE(NameOf(JointAt(body, place)).ends_with(NextToken(places, " ")));
+}
+
 TEST(FindBodyByNames, WordsAreUnderstoodInTheirCompany)
 {
     const std::tuple<const char*, const char*, EBodyJoint, const char*> rows[] = {
