@@ -110,10 +110,10 @@ TEST_F(ToolTest, ASelectedMappingSelectsItsBones)
 
 TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
 {
-    const auto setNumbers = [](CMapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
-    const auto setRate = [](CMapLine& line) { line.frameRate = 25; };
-    const auto setText = [](CMapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
-    const std::tuple<const char*, int, std::function<void(CMapLine&)>, const char*> rows[] = {
+    const auto setNumbers = [](MapLine& line) { line.numbers = {1.9f, -2.9f, 720.0f}; };
+    const auto setRate = [](MapLine& line) { line.frameRate = 25; };
+    const auto setText = [](MapLine& line) { line.text = "\u00c4 name of more than thirty-two characters"; };
+    const std::tuple<const char*, int, std::function<void(MapLine&)>, const char*> rows[] = {
         {"a text, cut", 0, setText, "\u00c4 name of more than thirty-two c"},
         {"the position", 1, setNumbers, "Position 1,-2,720"},
         {"the frame rate", 2, setRate, "FrameRate 25"},
@@ -126,11 +126,11 @@ TEST_F(ToolTest, DetailWritesTheLineAnewFromItsKind)
     {
         SCOPED_TRACE(what);
         m_kTool.SelectLine(original);
-        m_kToolWindow.m_kOnEdit = nullptr;
+        m_kToolWindow.onEdit = nullptr;
         const std::string before = m_kTool.Map().SelectedLine()->text;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().SelectedLine()->text, before) << "cancelled";
-        m_kToolWindow.m_kOnEdit = edit;
+        m_kToolWindow.onEdit = edit;
         Click(kToolDetail);
         EXPECT_EQ(m_kTool.Map().Lines()[static_cast<size_t>(original)].text, text);
         EXPECT_EQ(m_kTool.Map().Selected(), original);

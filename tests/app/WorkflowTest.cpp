@@ -70,7 +70,7 @@ TEST_F(ContentTest, DiscardQuestion)
         const std::string path = m_kFolder.Path("kept.Kinetra");
         DeleteFile(path);
         m_kWindow.m_kAnswers[139] = answer;
-        m_kWindow.m_kSaveAnswer = saves ? std::optional(path) : std::nullopt;
+        m_kWindow.saveAnswer = saves ? std::optional(path) : std::nullopt;
         EXPECT_EQ(Open(m_kFolder.Path("walk.bvh")), opened ? 1 : 0);
         EXPECT_EQ(m_kContent.IsConverted(), !opened);
         EXPECT_EQ(Exists("kept.Kinetra"), saved);

@@ -85,7 +85,7 @@ TEST(Paths, SplitIntoFolderStemAndExtension)
     for (const auto& [path, folder, stem, extension] : rows)
     {
         SCOPED_TRACE(path);
-        const CPathParts parts = SplitPath(path);
+        const PathParts parts = SplitPath(path);
         EXPECT_EQ(parts.folder, folder);
         EXPECT_EQ(parts.stem, stem);
         EXPECT_EQ(parts.extension, extension);

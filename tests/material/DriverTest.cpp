@@ -290,7 +290,7 @@ TEST_F(DriverTest, BMPIsWrittenTopDown)
 {
     auto picture = OpenPicture(Path(), "w");
     ASSERT_TRUE(picture);
-    const CPixelRGBA pixels[] = {{1, 2, 3, 4}, {5, 6, 7, 8}};
+    const PixelRGBA pixels[] = {{1, 2, 3, 4}, {5, 6, 7, 8}};
     EXPECT_FALSE(picture->WriteRowRGBA(0, 0, 2, pixels)) << "no size yet";
     ASSERT_TRUE(picture->SetSize({0, 0, 2, 2}));
     ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 2, pixels));
@@ -314,7 +314,7 @@ TEST_F(DriverTest, BMPOfOneChannelComesBackInGrey)
     EXPECT_FALSE(picture->SetChannelCount(2));
     ASSERT_TRUE(picture->SetChannelCount(1));
     ASSERT_TRUE(picture->SetSize({0, 0, 3, 1}));
-    const CPixelRGBA pixels[] = {{0, 0, 0, 9}, {255, 255, 255, 0}, {100, 100, 100, 0}};
+    const PixelRGBA pixels[] = {{0, 0, 0, 9}, {255, 255, 255, 0}, {100, 100, 100, 0}};
     ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 3, pixels));
     EXPECT_TRUE(picture->Close());
     picture = OpenPicture(Path(), "r");

@@ -180,7 +180,7 @@ TEST_F(CRetargeterTest, MappedBonesTakeTheWorldRotationOfTheirSourceUpToOffsets)
 // were worked out apart from the program, in the plane of the turn.
 TEST_F(CRetargeterTest, SharesAreInProportionToTheirWeights)
 {
-    const std::tuple<CBoneShares, Vec3, double> rows[] = {
+    const std::tuple<BoneShares, Vec3, double> rows[] = {
         {{1, 1, 1}, {40, 0, 0}, 20.0},   {{3, 1, 1}, {40, 0, 0}, 30.868}, {{1, 3, 1}, {40, 0, 0}, 20.0},
         {{0, 0, 1}, {40, 0, 0}, 0.0},    {{1, 1, 1}, {0, 40, 0}, 23.681}, {{3, 1, 1}, {0, 40, 0}, 22.197},
         {{1, 3, 1}, {0, 40, 0}, 35.369},
@@ -388,7 +388,7 @@ TEST_F(CRetargeterTest, ASourceOfTwiceTheSizeHasHalfTheScale)
 TEST_F(CRetargeterTest, ShareFileLines)
 {
     // bone: null where none gets shares
-    const std::tuple<const char*, std::string, const char*, CBoneShares> rows[] = {
+    const std::tuple<const char*, std::string, const char*, BoneShares> rows[] = {
         {"plain", "Waist Share 1 2 Type 0", "Waist", {1, 2, 0}},
         {"keywords without case, commas and colons", "SHARE: 3, 4, tYPE: 2, Neck", "Neck", {3, 4, 2}},
         {"type stays from the line before", "Type 2 Waist\nUpperTorso Share 1 5", "UpperTorso", {1, 5, 2}},
@@ -411,7 +411,7 @@ TEST_F(CRetargeterTest, ShareFileLines)
         CRetargeter retargeter;
         retargeter.SetScenes(m_kSource.Get(), m_kTarget.Get());
         ASSERT_TRUE(retargeter.LoadShares(path));
-        const CBoneShares* shares = nullptr;
+        const BoneShares* shares = nullptr;
         ASSERT_EQ(retargeter.Shares(Target(bone ? bone : "Neck"), shares), bone != nullptr);
         if (!bone)
             continue;

@@ -41,7 +41,7 @@ TEST(BoneOffsetDialog, ChosenAxisIsSwappedOutOfTheOtherBoxes)
     };
     for (const auto& [what, axis, chosen, before, after] : rows)
     {
-        CRowNumbers numbers;
+        RowNumbers numbers;
         numbers.axes = before;
         CBoneOffsetDialog dialog(numbers);
         const auto& entries = CBoneOffsetDialog::kAxisEntries;

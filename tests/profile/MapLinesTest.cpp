@@ -49,7 +49,7 @@ TEST(MapLines, LinesSayWhatTheirKeySays)
     };
     for (const auto& [what, text, says] : rows)
     {
-        const CMapLine line = ParseMapLine(text);
+        const MapLine line = ParseMapLine(text);
         EXPECT_EQ(line.text, text);
         EXPECT_EQ(Describe(line), says) << what;
     }

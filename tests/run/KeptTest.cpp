@@ -134,7 +134,7 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
 
 TEST(ProgressLine, SaysWhatIsKnownInTheWidthThereIs)
 {
-    const std::tuple<const char*, CProgress, size_t, const char*> rows[] = {
+    const std::tuple<const char*, RunProgress, size_t, const char*> rows[] = {
         {"nothing known", {0, 8, 0, 0.0}, 80, "[>                       ] 0/8"},
         {"half", {5, 10, 0, 2.5}, 80, "[============>           ] 5/10  2.5/s  2s left"},
         {"minutes", {0, 10000, 0, 100.0}, 80, "[>                       ] 0/10000  100.0/s  1m40s left"},
