@@ -34,6 +34,10 @@ function(gw_compile_options target)
             -Wconversion
             -Wnon-virtual-dtor
             -Woverloaded-virtual)
+  if(GAITWRIGHT_UNITY)
+    # To the compiler, a source that another one includes is a header, where types of unnamed namespaces are suspect.
+    target_compile_options(${target} PRIVATE -Wno-subobject-linkage)
+  endif()
   if(NOT GAITWRIGHT_SANITIZE AND NOT GAITWRIGHT_FUZZ)
     gw_harden(${target})
   endif()
