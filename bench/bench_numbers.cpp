@@ -1,4 +1,4 @@
-// Ratios within one run: both sides in turns, so that a noisy machine slows both.
+// Ratios within one run: both sides alternate, so a noisy machine slows both.
 
 #include "CKeyframeControl.h"
 #include "CNode.h"
@@ -26,7 +26,7 @@ std::vector<float> Angles(size_t count)
     return values;
 }
 
-// Writing a number against the library's exact conversion of the same number.
+// Writing a number, compared with the standard library's exact conversion.
 void WriteNumbers(benchmark::State& state)
 {
     const std::vector<float> values = Angles(100'000);
@@ -49,7 +49,7 @@ void WriteNumbers(benchmark::State& state)
 }
 BENCHMARK(WriteNumbers);
 
-// Reading a number against the library's.
+// Reading a number, compared with the standard library.
 void ReadNumbers(benchmark::State& state)
 {
     std::string text;
@@ -81,7 +81,7 @@ void ReadNumbers(benchmark::State& state)
 }
 BENCHMARK(ReadNumbers);
 
-// A container with big tracks, read by its list of fields, against a plain copy of its bytes.
+// Reading a container with large tracks through its list of fields, compared with copying its bytes.
 void ReadContainer(benchmark::State& state)
 {
     Ref<CNode> node = new CNode;

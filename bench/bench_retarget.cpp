@@ -1,4 +1,4 @@
-// What the rules of a conversion take, without reading and writing: both skeletons stand in memory.
+// The cost of a conversion without reading and writing: both skeletons are in memory.
 
 #include "CMotionFile.h"
 #include "CRetargeter.h"
@@ -18,7 +18,7 @@ namespace {
 
 constexpr int kRepeats = 100;
 
-// The example's steps, over and over.
+// The example's steps, repeated.
 void WriteLongWalk(const std::string& path)
 {
     std::ifstream walk(GAITWRIGHT_ROOT "/examples/walk.bvh");
@@ -35,7 +35,7 @@ void WriteLongWalk(const std::string& path)
         out << whole.substr(rows);
 }
 
-/// A conversion that is ready to run.
+/// A prepared conversion.
 class CPreparedConversion
 {
 public:
@@ -58,7 +58,7 @@ public:
         m_kRetargeter.Retarget(0.0f, m_kSource.GetLastFrame(), 0.0f, m_kSource.GetFrequency(),
                                {0.0f, 923.0f, 13.0f}, true, true);
     }
-    /// Bones of the target times frames.
+    /// Returns the number of target bones times frames.
     double Steps() const
     {
         return static_cast<double>(NodesOf(*m_kTarget.motionRoot).size()) * m_kSource.GetKeyCount();
@@ -70,8 +70,8 @@ private:
     CRetargeter m_kRetargeter;
 };
 
-// Microseconds of CPU time for each bone and frame, legs included. A time and no ratio: there is nothing
-// beside it that others would know.
+// CPU time in microseconds per bone and frame, legs included. This is a time and not a ratio, because there
+// is no common reference.
 void Retarget(benchmark::State& state)
 {
     CPreparedConversion conversion;

@@ -1,5 +1,5 @@
-// Converts all motions of a folder one after the other in this process: what worker processes are measured
-// against.
+// Converts all motions of a folder one after the other in this process, as the reference for worker
+// processes.
 //
 //   convert_loop FOLDER PROFILE OUTPUT_FOLDER
 #include "ConvertMotionFile.h"

@@ -3,9 +3,9 @@
 
     bench/growth.py BIN_FOLDER [--svg FILE] [--runs N]
 
-CPU time of whole processes; the least of some runs, in turns over all sizes: what others do on a machine only adds.
-For both rows of sizes prints each, the fitted line and how far the worst size lies from it, in percent of the largest
-value.
+Uses the CPU time of whole processes: the minimum of several runs, alternating between all sizes, because other load
+can only add time. For both series of sizes, prints each value, the fitted line and the largest deviation from it in
+percent of the largest value.
 """
 import argparse
 import os
@@ -20,7 +20,7 @@ FRAMES = (1_000, 10_000, 25_000, 40_000, 55_000, 70_000, 85_000, 100_000)
 FRAMES_OF_JOINTS, JOINTS_OF_FRAMES = 4_000, 25
 
 WIDTH, HEIGHT, LEFT, TOP, GAP = 380, 250, 64, 44, 90
-# Colours stand in the elements, for viewers that read no style; the style is for dark pages.
+# Elements have colors for viewers that ignore styles; the style is for dark pages.
 STYLE = """@media (prefers-color-scheme: dark) {
 text { fill: #e6edf3 } .axis { stroke: #8b949e } .line { stroke: #58a6ff } .point { fill: #ffa657 } }"""
 TEXT = 'font-family="sans-serif" font-size="13" fill="#24292f"'
@@ -28,20 +28,20 @@ AXIS = 'class="axis" fill="none" stroke="#57606a" stroke-width="%g"'
 
 
 def fit(points):
-    """The line of least squares: offset, slope."""
+    """Returns the least-squares line: offset, slope."""
     x, y = zip(*points)
     line = statistics.linear_regression(x, y)
     return line.intercept, line.slope
 
 
 def residual(points):
-    """The distance of the worst point from the line, as a share of the largest value."""
+    """Returns the largest deviation from the line, as a share of the largest value."""
     offset, slope = fit(points)
     return max(abs(y - offset - slope * x) for x, y in points) / max(y for _, y in points)
 
 
 def steps(largest):
-    """Round numbers from 0 to the first one not below the largest."""
+    """Returns round numbers from 0 up to at least the largest value."""
     step = next(s * 10 ** e for e in range(-3, 8) for s in (1, 2, 5) if largest / (s * 10 ** e) <= 6)
     return [step * i for i in range(int(-(-largest // step)) + 1)]
 
@@ -78,7 +78,7 @@ def draw(path, panels):
 
 
 def measure(options, folder, sizes):
-    """The CPU seconds for sizes of (frames, joints)."""
+    """Returns the CPU seconds for sizes (frames, joints)."""
     profile, seconds = folder + "/bench.prf", {size: [] for size in sizes}
     write_profile(profile)
     for frames, joints in sizes:

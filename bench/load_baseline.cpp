@@ -1,4 +1,4 @@
-// Loads a motion with libassimp and nothing more: the yardstick of the whole-process benchmark.
+// Loads a motion with libassimp and does nothing else: the reference of the whole-process benchmark.
 
 #include <assimp/Importer.hpp>
 #include <assimp/scene.h>

@@ -1,4 +1,4 @@
-"""Motions of any number of joints and frames, made up, and a profile that fits them."""
+"""Generates motions of any number of joints and frames, and a matching profile."""
 import math
 
 SIDES = ("Left", "Right")
@@ -8,7 +8,7 @@ USUAL_JOINTS = 75
 
 
 def joints(count=USUAL_JOINTS):
-    """Name, parent and offset: a body of 21, from 61 joints on with fingers, then chains of five from the head on."""
+    """Returns name, parent and offset: a body of 21 joints, fingers if there are 61 or more, then chains of five."""
     out = [("Hips", None, (0, 95, 0)), ("Spine", "Hips", (0, 11, 0)), ("Spine1", "Spine", (0, 16, 0)),
            ("Neck", "Spine1", (0, 25, 0)), ("Head", "Neck", (0, 10, 1))]
     for side, sign in zip(SIDES, (1, -1)):
@@ -31,7 +31,7 @@ def joints(count=USUAL_JOINTS):
 
 
 def write_motion(path, megabytes=0, frames=0, count=USUAL_JOINTS):
-    """A motion of a size, or of a number of frames. Every joint turns about all axes."""
+    """Writes a motion of a given size or frame count. Every joint rotates about all axes."""
     table = joints(count)
     lines = ["HIERARCHY"]
 

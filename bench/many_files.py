@@ -1,12 +1,12 @@
 #!/usr/bin/env python3
-"""Converts an archive of many files by several processes, and says how fast, how whole and how alike.
+"""Converts an archive of many files with several processes, and checks speed, completeness and equality of results.
 
     bench/many_files.py BIN_FOLDER [--count 10000] [--loop]
 
-Every hundredth file is broken. Prints the time and rate of a first run, the time of a second one that finds all done,
-whether one process and eight leave the same bytes, and the share of the workers' time that went into conversions.
-With --loop, two of the programs that convert a folder in their own process (convert_loop), each on half of the archive
-and on a core of its own, are measured in turns against --jobs 2 on the whole.
+Every hundredth file is broken. Prints the time and rate of a first run, the time of a second one that finds everything
+done, whether one process and eight produce the same bytes, and the share of the workers' time that went into
+conversions. With --loop, two of the programs that convert a folder in their own process (convert_loop), each on half
+of the archive and on a core of its own, are measured alternately with --jobs 2 on the whole.
 """
 import argparse
 import hashlib
@@ -24,7 +24,7 @@ FILE_BYTES = 50_000
 
 
 def source(number):
-    """A walk of about 50 KB that is like no other: its rows begin elsewhere."""
+    """Returns a unique walk of about 50 KB: its rows begin at a different frame."""
     head, rows = (ROOT / "examples" / "walk.bvh").read_text().split("Frames: 67\n")
     frame_time, *frames = rows.splitlines()
     frames = (frames[number % len(frames):] + frames * 2)[:(FILE_BYTES - len(head)) // (len(frames[0]) + 1)]
@@ -85,7 +85,7 @@ class Bench:
         print("--jobs 1, 2 and 8: " + ("the same bytes" if len(set(digests.values())) == 1 else "OTHER BYTES"))
 
     def against_loop(self, rounds=5):
-        """In turns, so that a noisy machine slows both alike."""
+        """Measures both alternately, so that a noisy machine slows both alike."""
         profile = str(self.program.parent / "PoserBVH.prf")
         for number, path in enumerate(sorted((self.work / "archive").rglob("*.bvh"))):
             half = self.work / ("half%d" % (number % 2))

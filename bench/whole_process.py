@@ -1,14 +1,14 @@
 #!/usr/bin/env python3
-"""Measures whole processes in turns, so that a noisy machine slows both sides alike, and prints ratios of CPU time.
+"""Measures whole processes alternately, so that a noisy machine slows both sides alike, and prints ratios of CPU time.
 
     bench/whole_process.py BIN_FOLDER [--what LINE ...] [--mb 0.1 1.5 100] [--joints 75] [--frames N] [--runs N] [--out FOLDER]
 
-one       a made motion of 75 joints, by a bone map given as a file. Its rate is 120: one row for each source frame
-four      by an installed map that is named. Its rate is 30, as in all installed ones: four rows for each source frame
+one       a generated motion of 75 joints, with a bone map given as a file. Its rate is 120: one row per source frame
+four      with an installed map given by name. Its rate is 30, as in all installed ones: four rows per source frame
 chosen    without --profile: the program chooses the same map among all installed ones
 faithful  as "one", with --align --faithful
-info      prints what the motion holds
-choice    "chosen" against "four": what choosing costs
+info      prints facts about the motion
+choice    "chosen" compared with "four": the cost of choosing
 
 The other side only loads the same file with another library, except for "choice". Prints the median of each side, the
 median of the ratios of neighbors, and the peak memory, also as a multiple of the file. Results go to the folder, by
@@ -29,7 +29,7 @@ LEAST_RUNS_BYTES = 10e6  # a smaller file takes so little time that it is run te
 
 
 def run(command):
-    """CPU seconds of one process."""
+    """Runs one process and returns its CPU seconds."""
     with subprocess.Popen(command, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL) as process:
         _, status, usage = os.wait4(process.pid, 0)
         process.returncode = os.waitstatus_to_exitcode(status)
@@ -39,14 +39,14 @@ def run(command):
 
 
 def peak_of(command):
-    """Peak bytes; by a small program, since a process begins with the peak of the one that starts it."""
+    """Returns the peak memory in bytes. Uses a small program, because a process starts with its parent's peak."""
     done = subprocess.run(["/usr/bin/time", "-f", "%M", *command], stdout=subprocess.DEVNULL, stderr=subprocess.PIPE)
     return int(done.stderr.split()[-1]) * 1024
 
 
 def compare(name, path, ours, others, runs):
     runs *= 1 if os.path.getsize(path) > LEAST_RUNS_BYTES else 10
-    run(ours), run(others)  # from here on both files are in memory
+    run(ours), run(others)  # afterwards, both files are in memory
     a, b = zip(*((run(ours), run(others)) for _ in range(runs)))
     ratio = statistics.median(x / y for x, y in zip(a, b))
     peak = peak_of(ours)
@@ -55,7 +55,7 @@ def compare(name, path, ours, others, runs):
 
 
 def commands(folder, options):
-    """Both sides of every line."""
+    """Returns both sides of every line."""
     tool, motion, profile = os.path.join(options.bin, "gaitwright"), folder + "/motion.bvh", folder + "/bench.prf"
     write_profile(profile)
     load = [os.path.join(options.bin, "load_baseline"), motion]

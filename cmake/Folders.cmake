@@ -1,8 +1,8 @@
-# Where an installation keeps things. The programs stand beside their modules, with links where a shell looks for
-# them. What they need besides is found from there, so that an installation may be moved as a whole.
+# The folders of an installation. The programs are next to their modules, and links to them are on the search path of
+# shells. Programs find all other files relative to themselves, so an installation can be moved as a whole.
 if(CMAKE_LIBRARY_ARCHITECTURE AND (NOT DEFINED CMAKE_INSTALL_LIBDIR OR CMAKE_INSTALL_LIBDIR STREQUAL "lib"))
-  # As Debian has it. By itself CMake does so below /usr only, which an installation to be packaged is not made for,
-  # and keeps "lib" in a folder that was configured so.
+  # As in Debian. By default, CMake does this only for the prefix /usr, which is not the prefix of a packaged build,
+  # and it keeps "lib" in a build folder that was configured with it.
   set(CMAKE_INSTALL_LIBDIR lib/${CMAKE_LIBRARY_ARCHITECTURE} CACHE PATH "Object code libraries" FORCE)
 endif()
 include(GNUInstallDirs)
@@ -12,7 +12,7 @@ set(GAITWRIGHT_SHARED ${CMAKE_INSTALL_DATADIR}/gaitwright)
 file(RELATIVE_PATH GAITWRIGHT_SHARED_FROM_PROGRAMS ${CMAKE_INSTALL_FULL_LIBDIR}/gaitwright
      ${CMAKE_INSTALL_FULL_DATADIR}/gaitwright)
 
-# gw_rooms_seen(RESULT targets...): the targets themselves and all rooms that they see.
+# gw_rooms_seen(RESULT targets...): sets RESULT to the targets and all rooms that they see.
 function(gw_rooms_seen result)
   set(ahead ${ARGN})
   set(seen)
@@ -29,8 +29,8 @@ function(gw_rooms_seen result)
   set(${result} ${seen} PARENT_SCOPE)
 endfunction()
 
-# gw_modules_below(RESULT FOLDER): the modules that are built beside the programs, in a folder's CMake files and
-# those below.
+# gw_modules_below(RESULT FOLDER): sets RESULT to the modules that a folder and its subfolders build next to the
+# programs.
 function(gw_modules_below result folder)
   get_directory_property(targets DIRECTORY ${folder} BUILDSYSTEM_TARGETS)
   get_directory_property(folders DIRECTORY ${folder} SUBDIRECTORIES)

@@ -1,13 +1,13 @@
-# Every folder is one target, made by these functions. A target sees the headers of its own folder and of the
-# targets that it names, and nothing else.
+# Every folder is one target, created by these functions. A target sees only the headers of its own folder and of the
+# targets that it names.
 
 find_program(GAITWRIGHT_CCACHE ccache)
 if(GAITWRIGHT_CCACHE)
   set(CMAKE_CXX_COMPILER_LAUNCHER ${GAITWRIGHT_CCACHE})
 endif()
 
-# What makes a fault in a release harder to exploit. In the rooms of the inner loops, checks of containers and of every
-# function's stack would cost 6 % of a conversion; there only functions with buffers are checked.
+# Hardening of release builds. In the rooms with inner loops, checking containers and every function's stack would
+# cost 6 percent of a conversion, so only functions with buffers are checked there.
 set(GAITWRIGHT_INNER_ROOMS gw_math gw_base gw_scene gw_motion gw_retarget)
 set(GAITWRIGHT_HARDENING -U_FORTIFY_SOURCE -D_FORTIFY_SOURCE=2)
 set(GAITWRIGHT_HARDENING_INNER ${GAITWRIGHT_HARDENING} -fstack-protector)
@@ -24,7 +24,7 @@ endfunction()
 
 # Compile options that every target of the project shares.
 function(gw_compile_options target)
-  # No contraction: the same source gives the same bits at every optimisation level.
+  # No contraction, so that results are bit-identical at every optimization level.
   target_compile_options(
     ${target}
     PRIVATE -ffp-contract=off
@@ -47,12 +47,12 @@ function(gw_compile_options target)
     target_link_options(${target} PRIVATE -fsanitize=address,undefined)
   endif()
   if(GAITWRIGHT_FUZZ)
-    # What a fuzzer steers by.
+    # Coverage that guides the fuzzer.
     target_compile_options(${target} PRIVATE -fsanitize=fuzzer-no-link)
   endif()
 endfunction()
 
-# gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the present folder.
+# gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the current folder.
 function(gw_room name)
   cmake_parse_arguments(ROOM "" "" "PUBLIC;PRIVATE" ${ARGN})
   file(GLOB sources CONFIGURE_DEPENDS *.cpp)
@@ -65,7 +65,7 @@ function(gw_room name)
   gw_compile_options(${name})
 endfunction()
 
-# gw_tests(NAME targets...): one test program of all sources in the present folder.
+# gw_tests(NAME targets...): one test program of all sources in the current folder.
 function(gw_tests name)
   file(GLOB sources CONFIGURE_DEPENDS *.cpp)
   add_executable(${name} ${sources})

@@ -1,4 +1,4 @@
-"""Makes the seeds of the fuzz targets: small files of every kind, which mutations begin from.
+"""Makes the seeds of the fuzz targets: small files of every kind as a start for mutations.
 
     make_corpus.py PROJECT_FOLDER CORPUS_FOLDER"""
 import json
@@ -10,11 +10,11 @@ from scene_seeds import scenes
 
 PROJECT, CORPUS = Path(sys.argv[1]), Path(sys.argv[2])
 sys.path.insert(0, str(PROJECT / "tests" / "cli"))
-import made  # noqa: E402: small motions that the tests make too
+import made  # noqa: E402: small motions that the tests use too
 
 
 def short_motion(path, frames):
-    """The first frames of a motion, so that a mutation costs little."""
+    """Returns the first frames of a motion, so that mutations are cheap."""
     lines = path.read_text().splitlines()
     rows = next(i for i, line in enumerate(lines) if line.startswith("Frames:"))
     kept = lines[:rows] + ["Frames: %d" % frames] + lines[rows + 1:rows + 2 + frames]
@@ -22,7 +22,7 @@ def short_motion(path, frames):
 
 
 def bmp(depth, width=5, height=4, palette=0, header=40):
-    """Rows of a depth; below 0 a height stands for rows from the top."""
+    """Returns a BMP file of a depth; a negative height means that rows start at the top."""
     offset = 14 + header + 4 * palette
     stride = (width * depth + 31) // 32 * 4
     head = struct.pack("<IiiHHIIiiII", header, width, height, 1, depth, 0, 0, 2835, 2835, palette, 0)
@@ -33,7 +33,7 @@ def bmp(depth, width=5, height=4, palette=0, header=40):
 
 
 def gif(width=4, height=4, interlaced=False, images=1, local=False, control=True):
-    """Each pixel is a code of its own behind a clear code, so that no table is needed."""
+    """Returns a GIF file. Each pixel is one code after a clear code, so no code table is needed."""
     palette = bytes(range(12))
     bits, held, count = 0, 0, b""
     for code in [4] + [c for i in range(width * height) for c in (i % 4, 4)] + [5]:
@@ -54,7 +54,7 @@ def directory(entries):
 
 
 def library(optional=0x20b):
-    """A library with one block of texts, 128 to 143, in one language."""
+    """Returns a library with one block of texts, 128 to 143, in one language."""
     words = [""] * 10 + ["Invalid file %s.", "*"] + [""] * 4
     block = b"".join(struct.pack("<H", len(w)) + w.encode("utf-16-le") for w in words)
     deeper = 1 << 31

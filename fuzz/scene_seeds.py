@@ -1,8 +1,8 @@
-"""Scene containers that hold every class, made field by field.
+"""Scene containers with every class, built field by field.
 
-A class is a text, one letter a field: f float, v vector, q quaternion, m matrix, i integer, c count, b flag, h short,
-s text, l link. A number before a letter repeats it, "#" before a field is a counted list of two, "?" before fields is
-the word that says they are there. Lists are of two elements throughout, and so is every count."""
+A class is a text with one letter per field: f float, v vector, q quaternion, m matrix, i integer, c count, b flag, h
+short, s text, l link. A number before a letter repeats it, "#" before a field is a counted list of two, "?" before
+fields is their presence word. All lists have two elements, and all counts are two."""
 import struct
 
 OBJECT = "s l l l "
@@ -65,7 +65,7 @@ def text(characters):
 
 
 class Fields:
-    """Values for the fields of one object: links as they were asked for, numbers that alternate."""
+    """Values for the fields of one object: the given links, and alternating numbers."""
 
     def __init__(self, name, links):
         self.name, self.links, self.number = name, iter(links), 0
@@ -117,7 +117,7 @@ class Scene:
 
 
 def meshes():
-    """A mesh with each kind of control, and what these work with."""
+    """Yields a mesh with each kind of control, and the objects that these need."""
     kinds = [kind for kind, layout in CLASSES.items() if layout.startswith(CONTROL)]
     for kind in kinds:
         scene = Scene().add("CTriMesh", 1, (2, 0, 0, 3, 3, 6, 4, 4))
@@ -128,8 +128,8 @@ def meshes():
 
 
 def pairs():
-    """What refers to objects of a certain class."""
-    rows = [  # holder, its links, kinds behind it from id 2 on
+    """Yields objects that refer to objects of a certain class."""
+    rows = [  # holder, its links, following classes starting at id 2
         ("CEditNormalControl", (0, 0, 0, 3, 0, 2), ("CEditNormalData", "CTriMesh")),
         ("CConnectControl", (0, 0, 0, 3, 0, 2), ("CConnectData", "CTriMesh")),
         ("CConnectData", (0, 0, 0, 2, 3), ("CTriMesh", "CTriMesh")),
@@ -150,7 +150,7 @@ def pairs():
 
 
 def scenes():
-    """Names and bytes of all seeds."""
+    """Yields names and bytes of all seeds."""
     for kind in CLASSES:
         yield "alone-" + kind, Scene().add(kind, 1).made
     everything = Scene()

@@ -1,5 +1,5 @@
-# The engine for other programs: find_package(Gaitwright), one imported target for each room, Gaitwright::app sees
-# nearly all of them. See examples/convert.
+# The engine for other programs: find_package(Gaitwright), with one imported target per room; Gaitwright::app
+# includes nearly all of them. See examples/convert.
 include(CMakePackageConfigHelpers)
 
 set(configs ${CMAKE_INSTALL_LIBDIR}/cmake/Gaitwright)

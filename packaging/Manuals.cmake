@@ -1,8 +1,8 @@
-# Man pages and completions. Those of the shell program are what it says itself, from its table of options.
+# Man pages and completions. The shell program generates its own from its table of options.
 find_program(GAITWRIGHT_GZIP gzip REQUIRED)
 
-# installed_text(FILE COMPONENT FOLDER command...): what a command prints, as a file of that name; compressed, and
-# the same on every day, where the name ends in .gz.
+# installed_text(FILE COMPONENT FOLDER command...): installs the output of a command as a file. A name in .gz is
+# compressed reproducibly.
 function(installed_text file component folder)
   set(text ${CMAKE_CURRENT_BINARY_DIR}/texts/${file})
   cmake_path(REMOVE_EXTENSION text LAST_ONLY OUTPUT_VARIABLE plain)
@@ -31,7 +31,7 @@ installed_text(bash/gaitwright shell ${share}/bash-completion/completions gaitwr
 installed_text(zsh/_gaitwright shell ${share}/zsh/vendor-completions gaitwright --completion zsh)
 installed_text(fish/gaitwright.fish shell ${share}/fish/vendor_completions.d gaitwright --completion fish)
 
-# What Debian asks of a package: whose it is and what changed.
+# Required by Debian: copyright and changelog.
 configure_file(changelog.in changelog @ONLY)
 foreach(component package IN ZIP_LISTS GAITWRIGHT_COMPONENTS GAITWRIGHT_PACKAGES)
   set(documents ${CMAKE_INSTALL_DATADIR}/doc/${package})

@@ -20,7 +20,7 @@ foreach(component package IN ZIP_LISTS GAITWRIGHT_COMPONENTS GAITWRIGHT_PACKAGES
   set(CPACK_DEBIAN_${COMPONENT}_PACKAGE_NAME ${package})
 endforeach()
 
-# A picture is drawn by a driver that is loaded by name.
+# Pictures are drawn by a driver that is loaded by name.
 set(CPACK_DEBIAN_SHELL_PACKAGE_SECTION graphics)
 set(CPACK_DEBIAN_SHELL_PACKAGE_RECOMMENDS libgl1-mesa-dri)
 set(CPACK_COMPONENT_SHELL_DESCRIPTION
@@ -32,7 +32,7 @@ and writes Kinetra files. Whole archives convert in one run.
 This package holds the command line program, which needs no display, the
 target skeleton and the bone maps of common conventions.")
 
-# So are the plugin that opens windows and the letters in them.
+# The window system plugin and the fonts are loaded by name too.
 set(CPACK_DEBIAN_DESKTOP_PACKAGE_SECTION graphics)
 set(CPACK_DEBIAN_DESKTOP_PACKAGE_DEPENDS
     "gaitwright (= ${PROJECT_VERSION}), qt6-qpa-plugins, libgl1-mesa-dri")
@@ -44,7 +44,7 @@ and result side by side, and saves a Kinetra file. An editor makes and
 changes bone maps.")
 
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_SECTION libdevel)
-set(CPACK_DEBIAN_DEVELOP_PACKAGE_SHLIBDEPS OFF) # there is nothing that could have any
+set(CPACK_DEBIAN_DEVELOP_PACKAGE_SHLIBDEPS OFF) # the package has no shared libraries
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_DEPENDS "gaitwright (= ${PROJECT_VERSION})")
 set(CPACK_COMPONENT_DEVELOP_DESCRIPTION
     "engine of Gaitwright for other programs, development files

@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-constexpr float kAxisLength = 0.1f; // radii
+constexpr float kAxisLength = 0.1f; // in radii
 
 void AddAxes(CDrawList& list, const Mat4& world, float radius)
 {
@@ -27,7 +27,7 @@ LineColor ColorOf(const CTriMesh& mesh, std::string_view highlight)
     return highlighted ? kHighlightColor : kBoneColor;
 }
 
-// The count is as the file has it; there may be fewer triangles.
+// The stored count can be larger than the number of triangles.
 size_t DrawnTriangles(CTriMesh& mesh)
 {
     const auto lines = static_cast<int64_t>(2.5 * mesh.GetTriangleQuantity());
@@ -42,7 +42,7 @@ void AddFaces(CDrawList& list, CTriMesh& mesh, LineColor color)
     for (size_t corner = 0; corner < corners; corner += 3)
     {
         const uint32_t* const p = &mesh.XYZTriIndexBuffer()[corner];
-        if (std::max({p[0], p[1], p[2]}) < points.size()) // a file may name points that there are not
+        if (std::max({p[0], p[1], p[2]}) < points.size()) // a file can refer to points that do not exist
             list.AddLoop(points[p[0]], points[p[1]], points[p[2]], color);
     }
 }

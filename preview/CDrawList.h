@@ -22,24 +22,23 @@ struct LineColor
     friend bool operator==(const LineColor&, const LineColor&) = default;
 };
 
-/// One end of a line, in world space: a vertex as GL takes it.
+/// One end of a line in world space, as a GL vertex.
 struct LineEnd
 {
     Vec3 point;
     LineColor color;
 };
 
-/// Coloured lines in the order of drawing, where later ones cover earlier ones. Cleared lists keep their
-/// memory.
+/// Colored lines in drawing order; later ones cover earlier ones. A cleared list keeps its memory.
 class CDrawList
 {
 public:
     void Clear() { m_kEnds.clear(); }
     void AddLine(const Vec3& from, const Vec3& to, LineColor color);
-    /// The outline of a triangle: a line from each corner to the next. This gives the pixels of a closed
-    /// loop, and loops and single lines can be drawn by one call.
+    /// Adds the outline of a triangle: a line from each corner to the next. This draws the same pixels as a
+    /// closed loop, and lets loops and single lines share one call.
     void AddLoop(const Vec3& a, const Vec3& b, const Vec3& c, LineColor color);
-    /// Two ends for each line.
+    /// Returns the ends, two per line.
     std::span<const LineEnd> Ends() const { return m_kEnds; }
 
 private:
@@ -54,9 +53,9 @@ inline constexpr LineColor kAxisColors[] = {
 inline constexpr LineColor kBoneColor{204, 204, 204}; ///< 0.8 of white
 inline constexpr LineColor kHighlightColor{255, 255, 0};
 
-/// Appends each mesh: the axes at its origin, a tenth of the radius long where the mesh is not scaled, then
-/// the outlines of its first five sixths of triangles; the last sixth has never been drawn. Meshes under a
-/// parent of the highlighted name take the highlight's colour; an empty name highlights none.
+/// Appends each mesh: the axes at its origin, a tenth of the radius long if the mesh is not scaled, then the
+/// outlines of the first five sixths of its triangles; the last sixth has never been drawn. Meshes under a
+/// parent with the highlighted name get the highlight color; an empty name highlights none.
 void BuildDrawList(CDrawList& list, std::span<const Ref<CTriMesh>> meshes, float radius,
                    std::string_view highlight);
 

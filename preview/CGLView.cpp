@@ -6,8 +6,8 @@ namespace gw {
 
 namespace {
 
-constexpr float kEyeDistance = 2.5f; // radii between eye and centre: the whole sphere fits into 45 degrees
-constexpr float kDragStep = 0.005f;  // radii that one pixel of the mouse moves
+constexpr float kEyeDistance = 2.5f; // radii between eye and center: the whole sphere fits into 45 degrees
+constexpr float kDragStep = 0.005f;  // radii per pixel of mouse movement
 
 } // namespace
 
@@ -34,7 +34,7 @@ void CGLView::FrameAll()
     if (!m_spkScene)
         return;
     const BoundSphere& bound = m_spkScene->m_kBound;
-    // Near plane, far plane and angle of view, which cameras carry and nothing reads.
+    // Near plane, far plane and angle of view, which are stored but not used.
     m_kCamera.m_afParameter[0] = 1.0f;
     m_kCamera.m_afParameter[1] = 90'000.0f;
     m_kCamera.m_afParameter[2] = 45.0f;

@@ -12,16 +12,16 @@
 
 namespace gw {
 
-/// The two keys that tell what dragging does.
+/// The two keys that determine what dragging does.
 struct DragKeys
 {
     bool leftCtrl = false;
     bool leftShift = false;
 };
 
-/// A view of one scene without a window: its clock, its camera, what the mouse does to it and the lines to be
-/// drawn. A window forwards to it, learns by the repaint callback when to draw, and draws what DrawScene
-/// answers.
+/// A view of one scene without a window: its clock, its camera, its reaction to the mouse, and the lines to
+/// draw. A window forwards events to it, is told by the repaint callback when to draw, and draws the result
+/// of DrawScene.
 class CGLView : public CMotionView
 {
 public:
@@ -30,7 +30,8 @@ public:
     CGLView(const CGLView&) = delete;
     CGLView& operator=(const CGLView&) = delete;
 
-    /// The scene's bound, as it stands, places the camera; nothing is evaluated. With null it stays.
+    /// Positions the camera by the scene's current bound, without updating the scene. With null, the camera
+    /// stays.
     void SetScene(CNode* root, float frameStep, float lastFrame) override;
     void SeekStart() override;
     void SeekEnd() override;
@@ -38,7 +39,7 @@ public:
     void StepBack() override;
     void Play() override;
     void StepForward() override;
-    /// A range of 0 or below is no place in the motion: nothing moves.
+    /// Ignored if the range is 0 or below.
     void Seek(int position, int range) override;
     void Advance() override;
 
@@ -49,31 +50,32 @@ public:
     void SetHighlight(const std::string& boneName) override { m_kHighlight = boneName; }
     void Repaint() override;
 
-    /// What Repaint calls; the window asks its toolkit there to be drawn soon.
+    /// Sets the function that Repaint calls, which should schedule a redraw.
     void SetRepaint(std::function<void()> repaint) { repaint_ = std::move(repaint); }
-    /// Camera and pan as SetScene would give them for the scene as it stands now.
+    /// Resets camera and pan as SetScene would for the current scene.
     void FrameAll();
 
-    /// The left button goes down, at a position in the view, and up. The window captures the mouse between.
+    /// Handles the left button going down, at a position in the view, and up. The window captures the mouse
+    /// in between.
     void MouseDown(int x, int y);
     void MouseUp();
-    /// Dragging pans; with the left Ctrl key it moves the eye along Z, never below 0; with the left Shift key
+    /// Dragging pans. With the left Ctrl key it moves the eye along Z, never below 0; with the left Shift key
     /// nothing moves.
     void MouseMove(int x, int y, DragKeys keys);
     bool IsDragging() const { return m_bDragging; }
 
-    /// Chooses and sets the format of the surface that the view is drawn on, before there is one. False,
-    /// after saying so, if there is no such format. A view without a surface needs none.
+    /// Chooses and sets the format of the surface, before it exists. Returns false, after reporting it, if
+    /// there is no such format. A view without a surface does not need one.
     virtual bool SetupPixelFormat() { return true; }
     /// Sets up a new, current GL context for drawing.
     virtual void InitGL() {}
-    /// The lines of the scene as it was evaluated last; valid until the next call.
+    /// Returns the lines of the scene in its current state; valid until the next call.
     virtual const CDrawList& DrawScene();
 
-    uint32_t m_uiTimer = 0;   ///< a window's timer; Stop zeroes it
+    uint32_t m_uiTimer = 0;   ///< a window's timer; Stop sets it to 0
     CCamera m_kCamera;        ///< m_kEye, m_kUp and m_kLookAt drive the view
     Vec3 m_kPan = kVec3Zero;  ///< extra translation of the camera's space
-    std::string m_kHighlight; ///< name of the bone that is drawn in another colour
+    std::string m_kHighlight; ///< name of the bone that is drawn in another color
 
 private:
     float End() const { return m_fFrameStep * m_fLastFrame; }
@@ -86,7 +88,7 @@ private:
     float m_fTime = 0.0f;
     float m_fFrameStep = 0.0f;
     float m_fLastFrame = 0.0f;
-    int m_iLastX = 0; // the mouse at the last event of a drag
+    int m_iLastX = 0; // mouse position at the last event of a drag
     int m_iLastY = 0;
     bool m_bDragging = false;
     bool m_bPlaying = false;

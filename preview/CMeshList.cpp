@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// Calls a function for each spatial of a tree, depth first, until it answers false.
+// Calls a function for each spatial of a tree, depth first, until it returns false.
 template <class F>
 bool WalkTree(CSpatial& spatial, F& visit)
 {

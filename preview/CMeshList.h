@@ -8,19 +8,19 @@
 
 namespace gw {
 
-/// The triangle meshes of a scene in the order in which a search finds them, kept from frame to frame. They
-/// stay alive while they are listed.
+/// The triangle meshes of a scene in search order, cached between frames. They are kept alive while they are
+/// listed.
 class CMeshList
 {
 public:
-    /// All meshes under a root. The search is made again only when the tree's spatials are others, or stand
-    /// elsewhere, than at the last call; valid until the next one.
+    /// Returns all meshes under a root. Searches again only if the tree's spatials or their order have
+    /// changed since the last call; valid until the next one.
     std::span<const Ref<CTriMesh>> Of(CSpatial& root);
     void Clear();
 
 private:
     std::vector<Ref<CSpatial>>
-        m_kTree; // depth first; counted, so that no new spatial can pass for an old one
+        m_kTree; // depth first; counted, so that a new spatial cannot reuse an old address
     std::vector<Ref<CTriMesh>> m_kMeshes;
 };
 

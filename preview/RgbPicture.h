@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// Pixels of three bytes, red first, row after row from the top.
+/// Pixels of three bytes, red first, row by row from the top.
 struct RgbPicture
 {
     int width = 0;
@@ -17,7 +17,7 @@ struct RgbPicture
     RgbPicture(int w, int h) : width(w), height(h), rgb(RowBytes() * static_cast<size_t>(h)) {}
 
     size_t RowBytes() const { return size_t{3} * static_cast<size_t>(width); }
-    /// The three bytes of a pixel inside.
+    /// Returns the three bytes of a pixel, which must be inside the picture.
     uint8_t* Pixel(int x, int y) { return rgb.data() + Offset(x, y); }
     const uint8_t* Pixel(int x, int y) const { return rgb.data() + Offset(x, y); }
 

@@ -9,29 +9,29 @@ namespace gw {
 class CNode;
 class CRetargeter;
 
-/// A bone-map profile as the program around it sees it: which source bone drives which target bone. The
-/// bodies here are defaults; the profile editor's model gives the real ones. Scenes are looked at and not
-/// kept alive.
+/// The interface of a bone map: which source bone drives which target bone. The default implementations do
+/// nothing; the profile editor overrides them. Scenes are not kept alive.
 class CBoneMapProfile
 {
 public:
     virtual ~CBoneMapProfile() = default;
 
     virtual void GetProfileName(std::string& name) const { name = m_kProfileName; }
-    /// Each stores a root that is not null and answers whether it was.
+    /// Each stores a root, if it is not null, and returns whether it did.
     virtual bool SetSourceScene(CNode* root) { return Store(m_pkSourceScene, root); }
     virtual bool SetTargetScene(CNode* root) { return Store(m_pkTargetScene, root); }
     virtual bool SetResultScene(CNode* root) { return Store(m_pkResultScene, root); }
-    /// The bone selected in a tree; false and an empty name where none is.
+    /// Stores the name of the bone selected in a tree; returns false with an empty name if none is.
     virtual bool GetSelectedSourceBone(std::string&) const { return true; }
     virtual bool GetSelectedTargetBone(std::string&) const { return true; }
     virtual bool LoadProfile(const std::string&) { return true; }
     virtual bool Reserved() { return true; }
-    /// How many mapping rows of a profile file find both bones, and how many there are.
+    /// Counts the mapping rows of a profile file whose bones both exist, and all rows.
     virtual bool CountMatches(const std::string&, int*, int*) { return true; }
-    /// Fills a retargeter's tables, or with null only marks the mapped bones. False when a row did not fit.
+    /// Fills a retargeter's tables, or with null only marks the mapped bones. Returns false if a row did not
+    /// fit.
     virtual bool ApplyProfile(CRetargeter*, int*, int*) { return true; }
-    /// Whether any row drives the target's root bone.
+    /// Returns whether any row drives the target's root bone.
     virtual bool HasRootMapping() const { return true; }
     virtual void GetRootOffset(Vec3& offset) const { offset = m_kRootOffset; }
     /// Frames per second.

@@ -8,10 +8,10 @@ namespace gw {
 
 namespace {
 
-// The limits are uneven by design: only X may be turned by half a circle.
+// The limits differ by design: only X can be rotated by half a turn.
 constexpr std::array<int, 3> kRotationLimit{180, 179, 179};
 
-// The other two boxes, in the order in which they are looked at.
+// The other two boxes, in the order in which they are checked.
 constexpr std::array<std::array<size_t, 2>, 3> kOtherAxes{
     {{1, 2}, {0, 2}, {0, 1}}
 };

@@ -8,28 +8,28 @@
 
 namespace gw {
 
-/// The dialog that edits rotation and axis conversion of one row, without its window: what the fields and
-/// boxes show, and what happens when the user leaves or chooses one. Axes are numbered 0, 1, 2 for X, Y, Z.
+/// The dialog for rotation and axis conversion of one row, without its window: the contents of fields and
+/// boxes, and the effect of user input. Axes are numbered 0, 1, 2 for X, Y, Z.
 class CBoneOffsetDialog
 {
 public:
-    /// The entries of each axis box, in order.
+    /// Entries of each axis box, in order.
     static constexpr std::array<std::string_view, 6> kAxisEntries{"X", "-X", "Y", "-Y", "Z", "-Z"};
 
     explicit CBoneOffsetDialog(const RowNumbers& numbers = {});
 
     const RowNumbers& Numbers() const { return m_kNumbers; }
 
-    /// What a rotation field shows.
+    /// Returns the text of a rotation field.
     const std::string& RotationText(int axis) const { return m_kRotationText[static_cast<size_t>(axis)]; }
-    /// A rotation field lost the focus with this text in it: a number within the limits is taken, and the
-    /// field shows the number in force. X goes from -180 through 180, Y and Z from -179 through 179.
+    /// Handles a rotation field losing the focus: a number within the limits is accepted, and the field shows
+    /// the current number. The range is -180 to 180 for X, and -179 to 179 for Y and Z.
     void LeaveRotation(int axis, std::string_view text);
 
-    /// The entry that an axis box shows.
+    /// Returns the selected entry of an axis box.
     int AxisEntry(int axis) const;
-    /// The user chose an entry of an axis box. A box that holds the same axis gets the one that was left, so
-    /// that the three stay a signed permutation.
+    /// Selects an entry of an axis box. If another box has the same axis, it gets the old one, so that the
+    /// three remain a signed permutation.
     void ChooseAxis(int axis, int entry);
 
 private:

@@ -17,7 +17,7 @@ void CBoneTree::Rebuild(CNode* root)
     root->FindObjects(nodes, nullptr, &CNode::ms_kRTTI, true);
     for (CObject* node : nodes)
     {
-        // By name and not by node: below a bone whose name was taken, bones hang on the item that has the
+        // By name, not by node: children of a bone whose name was taken are attached to the item with that
         // name.
         const CSpatial* parent = static_cast<CNode*>(node)->GetParent();
         if (node->GetName())
@@ -34,7 +34,7 @@ void CBoneTree::Add(std::string_view name, int parent)
     (Has(parent) ? m_kItems[Index(parent)].m_kChildren : m_kRootItems).push_back(item);
 }
 
-// Distinct names make a walk through the tree and a look-up the same.
+// Names are distinct, so a look-up finds the same as a search of the tree.
 int CBoneTree::Find(std::string_view name) const
 {
     const auto found = m_kByName.find(LowerCase(name));

@@ -9,15 +9,14 @@ namespace gw {
 
 class CNode;
 
-/// The bones of a skeleton as a tree of names, each with a marker that says whether a row maps it. Names are
-/// distinct without regard to case. Items are indices in the order of their adding, so a parent comes before
-/// its children.
+/// The bones of a skeleton as a tree of names, each with a marker that shows whether a row maps it. Names are
+/// distinct, ignoring case. Items are numbered in insertion order, so parents come before their children.
 class CBoneTree
 {
 public:
     /// No item; as a parent, the root of the tree.
     static constexpr int kNone = -1;
-    /// Images of an item that is not mapped, and of a mapped one that is selected, in every tree.
+    /// Images of an unmapped item, and of a selected mapped one, in every tree.
     static constexpr int kUnmappedImage = 0;
     static constexpr int kSelectedUnmappedImage = 2;
     static constexpr int kSelectedMappedImage = 3;
@@ -30,21 +29,21 @@ public:
         bool m_bMapped = false;
     };
 
-    /// The argument is the image of a mapped item that is not selected; it tells the two trees apart.
+    /// `mappedImage` is the image of a mapped item that is not selected; it differs between the two trees.
     explicit CBoneTree(int mappedImage) : m_iMappedImage(mappedImage) {}
 
-    /// Lets go of all items and takes the named nodes of a skeleton, none for null. A node with the name of
-    /// an earlier one is left out; nothing is mapped or selected then.
+    /// Replaces all items by the named nodes of a skeleton; null has none. Nodes with an earlier node's name
+    /// are left out. Nothing is mapped or selected afterwards.
     void Rebuild(CNode* root);
-    /// The item with a name without regard to case, or kNone.
+    /// Returns the item with a name, ignoring case, or kNone.
     int Find(std::string_view name) const;
-    /// Nothing for an item that is none.
+    /// Ignored for an invalid item.
     void Mark(int item, bool mapped);
     bool IsMapped(int item) const { return Has(item) && m_kItems[Index(item)].m_bMapped; }
-    /// Selects an item, or with kNone nothing.
+    /// Selects an item, or none with kNone.
     void Select(int item) { m_iSelected = Has(item) ? item : kNone; }
     int Selected() const { return m_iSelected; }
-    /// The text of the selected item; empty when there is none.
+    /// Returns the text of the selected item; empty if there is none.
     const std::string& SelectedText() const { return Text(m_iSelected); }
     const std::string& Text(int item) const;
 
@@ -55,7 +54,7 @@ public:
     }
 
     const std::vector<Item>& Items() const { return m_kItems; }
-    /// The items directly below the root.
+    /// Returns the items directly below the root.
     const std::vector<int>& RootItems() const { return m_kRootItems; }
 
 private:
@@ -65,7 +64,7 @@ private:
 
     std::vector<Item> m_kItems;
     std::vector<int> m_kRootItems;
-    std::unordered_map<std::string, int> m_kByName; // in lower case
+    std::unordered_map<std::string, int> m_kByName; // in lowercase
     int m_iSelected = kNone;
     int m_iMappedImage;
 };

@@ -77,7 +77,7 @@ void CMapRowTable::AddRow(std::string_view source, std::string_view target, cons
     }
     Row& row = found == kNone ? m_kRows.back() : m_kRows[Index(found)];
     row[kTargetColumn] = target;
-    // The test is against 0 and not against kNone: the first row keeps the rotation that it came with.
+    // The comparison is with 0 instead of kNone: the first row keeps its initial rotation.
     if (found != 0)
         WriteRotation(row, numbers);
     if (columns == ERowColumns::All)

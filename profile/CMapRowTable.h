@@ -11,26 +11,26 @@
 
 namespace gw {
 
-/// Columns of the row table. Numbers stand in it as texts.
+/// Columns of the row table. Numbers are stored as text.
 enum EMapColumn : int
 {
     kSourceColumn = 0,
     kTargetColumn = 1,
     kRotationColumn = 2, ///< X, Y and Z
-    kAxisColumn = 5,     ///< X, Y and Z; empty where neutral
+    kAxisColumn = 5,     ///< X, Y and Z; empty if neutral
     kMapColumnCount = 8,
 };
 
-/// How a column is shown. Widths are shares of the table's width, divided as integers.
+/// How a column is displayed. Widths are fractions of the table's width, by integer division.
 struct MapColumnTitle
 {
-    int messageId; ///< 0 where the title is a blank
+    int messageId; ///< 0 if the title is a blank
     bool alignRight;
     int widthNumerator;
     int widthDenominator;
 };
 
-/// The titles of the eight columns and of a ninth, empty one that fills the rest.
+/// Titles of the eight columns and of a ninth, empty one that fills the rest.
 inline constexpr MapColumnTitle kMapColumnTitles[] = {
     {149, false, 6, 25},
     {150, false, 6, 25},
@@ -43,14 +43,14 @@ inline constexpr MapColumnTitle kMapColumnTitles[] = {
     {0,   true,  1, 19},
 };
 
-/// Which columns AddRow writes.
+/// The columns that AddRow writes.
 enum class ERowColumns
 {
     All,
-    NamesAndRotation, ///< the axes stay as they are
+    NamesAndRotation, ///< the axes are not changed
 };
 
-/// The rows of a bone map, at most one for each target bone, and which of them are selected.
+/// The rows of a bone map, at most one per target bone, and their selection.
 class CMapRowTable
 {
 public:
@@ -59,33 +59,33 @@ public:
     using Row = std::array<std::string, kMapColumnCount>;
 
     int RowCount() const { return static_cast<int>(m_kRows.size()); }
-    /// The text in a row and column; empty for a row that is none.
+    /// Returns the text in a row and column; empty for an invalid row.
     const std::string& Text(int row, int column) const;
     bool IsFixed(int row) const;
-    /// Rotation and axes of a row as numbers. An empty axis is the neutral one.
+    /// Returns a row's rotation and axes as numbers. An empty axis is the neutral one.
     RowNumbers Numbers(int row) const;
-    /// The row of a target bone without regard to case, or kNone.
+    /// Returns the row of a target bone, ignoring case, or kNone.
     int FindTarget(std::string_view target) const;
-    /// Whether all texts are equal, whatever is selected.
+    /// Returns whether all texts are equal; the selection is ignored.
     bool HasSameRows(const CMapRowTable& other) const { return m_kRows == other.m_kRows; }
 
-    /// Appends a row, or changes the one of the same target. A row's source never changes, and the row at
-    /// index 0 keeps the rotation that it was added with.
+    /// Appends a row, or changes the one with the same target. A row's source never changes, and row 0 keeps
+    /// its initial rotation.
     void AddRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                 ERowColumns columns);
-    /// Sees to it that each of the bones that no source drives has a row. New rows are fixed ones.
+    /// Adds a fixed row for each bone that no source drives, unless it has a row.
     void AddPelvisRows();
-    /// Nothing for a row that is none.
+    /// Ignored for an invalid row.
     void RemoveRow(int row);
     void Clear();
 
     void Select(int row, bool selected);
-    /// Makes a row the only selected one; with kNone none is.
+    /// Makes a row the only selected one, or none with kNone.
     void SelectOnly(int row);
     bool IsSelected(int row) const { return Has(row) && m_kSelected[Index(row)]; }
     int SelectedCount() const;
     bool IsFixedSelected() const;
-    /// The first selected row behind an index, or kNone; kNone begins at the start.
+    /// Returns the first selected row after an index, or kNone. Start with kNone.
     int NextSelected(int after) const;
 
 private:
@@ -93,10 +93,10 @@ private:
     bool Has(int row) const { return row >= 0 && row < RowCount(); }
     void IndexTargets() const;
 
-    std::deque<Row> m_kRows;       // Remove All takes rows off the front
-    std::vector<bool> m_kSelected; // one for each row
-    // By target in small letters; empty after a removal, which moves rows, until somebody looks for one. A
-    // file can name thousands of targets, and each row that it adds looks for its own.
+    std::deque<Row> m_kRows;       // Remove All removes rows from the front
+    std::vector<bool> m_kSelected; // one per row
+    // By target in lowercase. Cleared by a removal, which moves rows, and rebuilt by the next look-up. A file
+    // can name thousands of targets, and each row it adds looks for its own.
     mutable std::unordered_map<std::string, int> m_kRowOfTarget;
 };
 

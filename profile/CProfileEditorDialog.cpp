@@ -1,3 +1,7 @@
+// The profile editor's rules. Every user command is wrapped in a CUserCommand, which records one step of undo
+// if the profile has changed at the end. Some rules look odd (row 0 keeps its rotation, removals do not
+// correct indices); bone maps made with earlier versions depend on them.
+
 #include "CProfileEditorDialog.h"
 
 #include "ApplyRow.h"
@@ -54,7 +58,7 @@ bool SelectedText(const CBoneTree& tree, std::string& name)
 
 } // namespace
 
-// What happens in its lifetime is one step of undo.
+// Everything that happens during its lifetime is one step of undo.
 class CProfileEditorDialog::CUserCommand
 {
 public:
@@ -145,7 +149,7 @@ bool CProfileEditorDialog::ApplyProfile(CRetargeter* retargeter, int* matched, i
     return match.foundCount == match.rowCount;
 }
 
-// By value: the path may be the member that reading changes.
+// By value, because the path may be the member that reading changes.
 bool CProfileEditorDialog::ReadProfile(std::string path, int* matched, int* total, EProfileRead mode)
 {
     const bool load = mode == EProfileRead::Load;
@@ -174,7 +178,7 @@ bool CProfileEditorDialog::ReadProfile(std::string path, int* matched, int* tota
     return fits;
 }
 
-// False when a row's target is there and its source is not.
+// Returns false if a row's target exists but its source does not.
 bool CProfileEditorDialog::ReadLines(CProfileReader& reader, int* matched, int* total, EProfileRead mode)
 {
     const CBoneNames sources(m_pkSourceScene);
@@ -279,7 +283,7 @@ void CProfileEditorDialog::RemoveSelection()
     int row = m_kRows.NextSelected(CMapRowTable::kNone);
     while (row != CMapRowTable::kNone)
     {
-        const int next = m_kRows.NextSelected(row); // asked before the removal, and not corrected by it
+        const int next = m_kRows.NextSelected(row); // determined before the removal, and not corrected by it
         RemoveMapRow(row);
         MarkChanged();
         UpdateButtons();
@@ -343,7 +347,7 @@ void CProfileEditorDialog::CommitNumbers(EFieldCommit mode)
 void CProfileEditorDialog::CommitName(EFieldCommit mode)
 {
     const std::string name = m_kFields.ReadName();
-    // A file can have a longer name than the field gives back; leaving the field does not rename the profile.
+    // A file can contain a longer name than the field returns; leaving the field must not rename the profile.
     const std::string_view present = CutTrailing(FirstCharacters(m_kProfileName, kProfileNameLimit));
     if (mode != EFieldCommit::Apply || EqualNoCase(name, present))
         return;
@@ -351,7 +355,7 @@ void CProfileEditorDialog::CommitName(EFieldCommit mode)
     {
         owner_.ShowMessage(kNameInvalid, EButtons::OK);
         m_kFields.Set(kNameField, m_kProfileName);
-        m_bDirty = false; // also where earlier changes were pending
+        m_bDirty = false; // even if earlier changes were pending
         return;
     }
     m_kProfileName = name;

@@ -16,7 +16,7 @@ namespace gw {
 class CProfileReader;
 struct ProfileLine;
 
-/// Controls of the profile editor beside its fields, with the numbers that they have always had.
+/// Control ids of the profile editor, apart from its fields; the numbers never change.
 enum EProfileControl : int
 {
     kAddToMapButton = 5,
@@ -29,7 +29,7 @@ enum EProfileControl : int
     kMapRowList = 1008,
 };
 
-/// Which buttons of the profile editor take a click.
+/// Which buttons of the profile editor are enabled.
 struct ProfileButtons
 {
     bool addToMap = false;
@@ -41,25 +41,24 @@ struct ProfileButtons
 
 enum class EProfileRead
 {
-    Count, ///< only count the rows that fit; name and path change all the same
-    Load,  ///< also replace the rows and numbers
+    Count, ///< only count the rows that fit; name and path change anyway
+    Load,  ///< also replace rows and numbers
 };
 
 enum class EProfileWrite
 {
-    Ask,   ///< before a file is overwritten
-    Quiet, ///< overwrite without a question
+    Ask,   ///< ask before a file is overwritten
+    Quiet, ///< overwrite without asking
 };
 
 enum class EFieldCommit
 {
-    Check, ///< bring the fields within their limits
-    Apply, ///< also store what they hold
+    Check, ///< clamp the fields to their limits
+    Apply, ///< also store their values
 };
 
 /// The profile editor without its window: the current profile, and the rules by which it changes. A window
-/// shows what the accessors answer and forwards what the user does; scenes and owner are looked at and must
-/// outlive their use.
+/// displays the accessors' values and forwards user actions. Scenes and owner must outlive their use.
 class CProfileEditorDialog : public CBoneMapProfile
 {
 public:
@@ -78,55 +77,56 @@ public:
     bool HasRootMapping() const override;
     void PromptSaveChanges() override;
 
-    /// The names that a renamed profile must not take, or null; looked at until another list is set.
+    /// Sets the names that a renamed profile must not use, or null. The list must stay valid until another
+    /// one is set.
     void SetNamesInUse(const std::vector<std::string>* names) { m_pkNamesInUse = names; }
 
-    // What a window shows.
+    // State for a window to show.
     const CMapRowTable& Rows() const { return m_kRows; }
     const CBoneTree& SourceTree() const { return m_kSourceTree; }
     const CBoneTree& TargetTree() const { return m_kTargetTree; }
-    /// The text of the field with a control id; empty for other ids.
+    /// Returns the text of a field; empty for other ids.
     const std::string& FieldText(int id) const { return m_kFields.Text(id); }
     const ProfileButtons& Buttons() const { return m_kButtons; }
     bool IsDirty() const { return m_bDirty; }
     bool IsVisible() const { return m_bVisible; }
     const std::string& ProfilePath() const { return m_kProfilePath; }
 
-    // What a window delivers.
-    /// A button was clicked; nothing for a disabled one and for ids that are none.
+    // Events from a window.
+    /// Handles a button click; ignores disabled buttons and unknown ids.
     void ClickButton(int id);
-    /// The text of a field changed while it has the focus.
+    /// Handles a text change in the field that has the focus.
     void EditField(int id, std::string_view text) { m_kFields.Set(id, text); }
-    /// A field lost the focus, by Enter and Escape too.
+    /// Handles a field losing the focus, also by Enter or Escape.
     void LeaveField();
     void SelectSourceItem(int item);
     void SelectTargetItem(int item);
-    /// The list's selection changed; nothing follows from it until the click arrives.
+    /// Handles a change of the list's selection; it has no effect until the click arrives.
     void SelectRow(int row, bool selected) { m_kRows.Select(row, selected); }
     void SelectOnlyRow(int row) { m_kRows.SelectOnly(row); }
-    /// A click on a row, or on none with -1, after its selection.
+    /// Handles a click on a row, or on none with -1, after its selection.
     void ClickRow(int row);
     void DoubleClickRow(int row);
     void Show() { m_bVisible = true; }
-    /// Hides the dialog; its state stays the current profile.
+    /// Hides the dialog; its state remains the current profile.
     void Close();
-    /// Each takes back or repeats one command of the user that changed rows, name or numbers. They go on
-    /// through a save, and end at the profile's loading.
+    /// Undo or redo one user command that changed rows, name or numbers. The history survives a save and is
+    /// cleared when a profile is loaded.
     void Undo();
     void Redo();
 
-    // The operations behind.
-    /// Reads a profile file. False when it cannot be opened, which changes nothing, and when a row's target
-    /// is in the target scene and its source is not in the source scene. The counters may be null.
+    // Operations.
+    /// Reads a profile file. Returns false, changing nothing, if it cannot be opened; also returns false if a
+    /// row's target exists but its source does not. The counters may be null.
     bool ReadProfile(std::string path, int* matched, int* total, EProfileRead mode);
-    /// Writes the profile to the file of its name, else to a new custom one. Whether a file was written.
+    /// Writes the profile to its file, or to a new custom one. Returns whether a file was written.
     bool WriteProfile(EProfileWrite mode);
 
-    /// Always true. The row at index 0 keeps its rotation.
+    /// Always returns true. Row 0 keeps its rotation.
     bool AddMapRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                    ERowColumns columns = ERowColumns::All);
     void RemoveMapRow(int row);
-    /// Sees to it that the two pelvis bones, which no source drives, have a row.
+    /// Adds fixed rows for the two pelvis bones, which no source drives, unless they exist.
     void ForcePelvisRows() { m_kRows.AddPelvisRows(); }
     void RebuildSourceTree() { m_kSourceTree.Rebuild(m_pkSourceScene); }
     void RebuildTargetTree() { m_kTargetTree.Rebuild(m_pkTargetScene); }
@@ -138,18 +138,18 @@ public:
     void CommitFields(EFieldCommit mode);
     void ShowFields();
     void UpdateButtons();
-    /// To be called before every change of a row, a number or a name: gives a profile whose file is read-only
-    /// a new name, so that a save never lands on it.
+    /// Call before every change of a row, number or name: gives a profile whose file is read-only a new name,
+    /// so that a save never overwrites it.
     void MarkChanged();
 
     void AddToMap();
-    /// Removes the selected rows. Indices are not corrected after a removal: of several selected rows, each
-    /// later removal hits the row behind the selected one.
+    /// Removes the selected rows. Indices are not corrected after a removal: with several selected rows, each
+    /// later removal affects the row after the selected one.
     void RemoveSelection();
     void RemoveAll();
-    /// Runs the offset dialog on the first selected row. False when there is none or the user cancels.
+    /// Runs the offset dialog for the first selected row. Returns false if there is none or the user cancels.
     bool EditBoneOffset();
-    /// Makes the two bones of a row the selection of the trees.
+    /// Selects the two bones of a row in the trees.
     void SelectRowBones(int row);
 
 private:

@@ -13,7 +13,7 @@ namespace gw {
 const std::string& CProfileFields::Text(int id) const
 {
     static const std::string kNoText;
-    const auto index = static_cast<size_t>(id - kNameField); // ids before the first wrap to large ones
+    const auto index = static_cast<size_t>(id - kNameField); // ids below the first one wrap to large numbers
     return index < m_kText.size() ? m_kText[index] : kNoText;
 }
 

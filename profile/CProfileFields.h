@@ -11,41 +11,40 @@ namespace gw {
 
 class CProfileOwner;
 
-/// The frame rates that the editor accepts. A file may hold others, which count all the same.
+/// The frame rates that the editor accepts. Files can contain others, which are used anyway.
 inline constexpr int kLowestFrameRate = 30;
 inline constexpr int kHighestFrameRate = 240;
 /// How far the root's position may lie from 0, on each axis.
 inline constexpr int kOffsetLimit = 10'000;
-/// The message about a number outside its limits, formatted with the two limits.
+/// The message about a number outside its limits; formatted with both limits.
 inline constexpr int kNumberLimitsMessage = 157;
 
-/// The edit fields of the profile editor, by their control ids.
+/// The edit fields of the profile editor, by control id.
 enum EProfileField : int
 {
     kNameField = 1038,
-    kOffsetXField = 1039, ///< the three offset fields are never shown and still read
+    kOffsetXField = 1039, ///< the three offset fields are never shown, but read
     kOffsetYField = 1040,
     kOffsetZField = 1041,
     kFrameRateField = 1042,
 };
 
-/// The texts that stand in the edit fields, which may differ from what the profile holds while the user
-/// types.
+/// The texts in the edit fields, which can differ from the profile while the user types.
 class CProfileFields
 {
 public:
-    /// The text of a field; empty for an id that is none.
+    /// Returns the text of a field; empty for an unknown id.
     const std::string& Text(int id) const;
-    /// Nothing for an id that is no field.
+    /// Ignored for an unknown id.
     void Set(int id, std::string_view text);
-    /// Writes a profile's values into all fields. The offset is cut to integers.
+    /// Writes a profile's values into all fields. The offset is truncated to integers.
     void Show(std::string_view name, const Vec3& rootOffset, int frameRate);
 
-    /// The numbers in the fields, brought within their limits. A field whose number was outside shows the
-    /// nearest limit then, and the owner tells the user.
+    /// Return the numbers in the fields, clamped to their limits. A field whose number was outside then shows
+    /// the limit, and the owner informs the user.
     Vec3 ReadRootOffset(CProfileOwner& owner);
     int ReadFrameRate(CProfileOwner& owner);
-    /// The name, cut to the characters that a name may have and without blanks at its end.
+    /// Returns the name, cut to the maximum length and without trailing blanks.
     std::string ReadName() const;
 
 private:
@@ -53,7 +52,7 @@ private:
 
     int ReadNumber(int id, int low, int high, CProfileOwner& owner);
 
-    std::array<std::string, kFieldCount> m_kText; // from kNameField on
+    std::array<std::string, kFieldCount> m_kText; // starting at kNameField
 };
 
 } // namespace gw

@@ -20,7 +20,7 @@ void CProfileHistory::Keep(CProfileState before, const CProfileState& after)
     m_kRedo.clear();
 }
 
-// A save gives states that differed in their name alone the same one: those are no steps any more.
+// A save makes states that differed only in their name equal; these are skipped.
 bool CProfileHistory::Step(States& from, States& to, CProfileState& present)
 {
     while (!from.empty() && from.back().IsSameProfile(present))

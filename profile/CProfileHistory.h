@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// All that a user can change in a profile, as it stood at one moment.
+/// Everything in a profile that a user can change, at one moment.
 struct CProfileState
 {
     CMapRowTable rows; ///< with their selection
@@ -19,29 +19,28 @@ struct CProfileState
     int frameRate = 0;
     bool dirty = false;
 
-    /// Whether rows, name and numbers are the same; path, selection and dirty flag have no say.
+    /// Returns whether rows, name and numbers are equal; path, selection and dirty flag are ignored.
     bool IsSameProfile(const CProfileState& other) const;
 };
 
-/// The states that undo and redo go through. Every state stands for itself, so that a step never depends on
-/// what the rows looked like when it is taken.
+/// The states for undo and redo. Each state is complete, so a step never depends on the current rows.
 class CProfileHistory
 {
 public:
-    /// Older states are forgotten: a hundred of a full skeleton take a few megabytes.
+    /// Older states are dropped: a hundred of a full skeleton take a few megabytes.
     static constexpr size_t kStepLimit = 100;
 
-    /// A command led from one state to another. What was undone before can no longer be redone then. Nothing
-    /// for a command that left the profile as it was.
+    /// Records the states before and after a command, and clears the redo states. Ignored if the command did
+    /// not change the profile.
     void Keep(CProfileState before, const CProfileState& after);
-    /// Each goes one step that changes the present profile; false, and the state left alone, where none is
-    /// left.
+    /// Each moves by one step that changes the present profile; returns false, leaving the state unchanged,
+    /// if there is none.
     bool Undo(CProfileState& present) { return Step(m_kUndo, m_kRedo, present); }
     bool Redo(CProfileState& present) { return Step(m_kRedo, m_kUndo, present); }
-    /// The present state was written to a file: every other one differs from that file now, and takes its
-    /// name, so that no undone name leads a later save to another profile's file.
+    /// Call after the present state was saved: all other states now differ from the file and get its name, so
+    /// that a later save of an undone state cannot write to another profile's file.
     void ProfileSaved(const std::string& name, const std::string& path);
-    /// Another profile is the present one.
+    /// Call when another profile becomes the current one.
     void Clear();
 
 private:
@@ -49,7 +48,7 @@ private:
 
     static bool Step(States& from, States& to, CProfileState& present);
 
-    States m_kUndo; // the state to go to next stands last, in both
+    States m_kUndo; // the next state is last, in both
     States m_kRedo;
 };
 

@@ -7,7 +7,7 @@ namespace gw {
 
 class CBoneOffsetDialog;
 
-/// Button sets of a message box, with the numbers that they have always had.
+/// Button sets of a message box; the numbers never change.
 enum class EButtons : int
 {
     OK = 0,
@@ -16,7 +16,7 @@ enum class EButtons : int
     YesNo = 4,
 };
 
-/// What a message box was answered with.
+/// The answer to a message box.
 enum class EAnswer : int
 {
     OK = 1,
@@ -25,27 +25,25 @@ enum class EAnswer : int
     No = 7,
 };
 
-/// What the profile editor asks of the program around it. No toolkit stands behind it but the one that
-/// implements it.
+/// What the profile editor needs from the program around it. Independent of any toolkit.
 class CProfileOwner
 {
 public:
     virtual ~CProfileOwner() = default;
 
-    /// Shows the message of an id, formatted with numbers where it takes some.
+    /// Shows a message by id, formatted with the numbers, if any.
     virtual EAnswer ShowMessage(int id, EButtons buttons, std::span<const int> numbers = {}) = 0;
-    /// The editor's state changed (buttons, selections): window message 1032.
+    /// The editor's state has changed (buttons, selections): window message 1032.
     virtual void ProfileStateChanged() = 0;
-    /// The set of profiles or a profile's name changed: window message 1033.
+    /// The set of profiles or a profile's name has changed: window message 1033.
     virtual void ProfileSetChanged() = 0;
-    /// The file of the profile with a display name, or empty.
+    /// Returns the file of the profile with a display name, or empty.
     virtual std::string FindProfilePath(const std::string& name) = 0;
-    /// The full path of a name in the folder of custom profiles, which is made where it is missing.
+    /// Returns the full path of a name in the folder of custom profiles, which is created if necessary.
     virtual std::string ProfileFile(const std::string& name) = 0;
-    /// The full path of a name beside the executable.
+    /// Returns the full path of a name next to the executable.
     virtual std::string ExeFile(const std::string& name) = 0;
-    /// Shows the offset dialog until the user ends it: true on OK, false on Cancel and where no window can
-    /// show it.
+    /// Shows the offset dialog: returns true on OK, false on Cancel or if no window can show it.
     virtual bool RunBoneOffset(CBoneOffsetDialog&) { return false; }
 };
 

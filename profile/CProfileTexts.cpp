@@ -20,7 +20,8 @@ constexpr off_t kPackByteLimit = off_t{64} << 20; // thousands of profiles
 
 using PackedTexts = std::unordered_map<std::string_view, std::string_view>;
 
-// Whatever is wrong with a pack, what was found before it is right: sizes and dates are compared as well.
+// If a pack is damaged, the entries before the damage are still valid, because sizes and dates are compared
+// as well.
 PackedTexts ReadPack(std::string_view rest)
 {
     PackedTexts texts;
@@ -42,7 +43,7 @@ bool StatusOf(const std::string& path, struct stat& status)
     return stat(path.c_str(), &status) == 0;
 }
 
-// A copy of an installation may have cut the dates to seconds, those of all its files alike.
+// A copied installation can have times truncated to seconds, equally for all its files.
 bool IsNewer(const struct stat& a, const struct stat& b)
 {
     return std::tuple(a.st_mtim.tv_sec, a.st_mtim.tv_nsec) > std::tuple(b.st_mtim.tv_sec, b.st_mtim.tv_nsec);
@@ -52,7 +53,7 @@ bool IsNewer(const struct stat& a, const struct stat& b)
 
 CProfileTexts::CProfileTexts(const std::string& folder)
 {
-    // The date before the content: a pack that is replaced meanwhile then counts as an old one.
+    // The time is read before the content: a pack that is replaced in between then counts as old.
     const std::string packPath = folder + std::string(kProfilePack);
     struct stat packStatus;
     PackedTexts packed;
@@ -60,7 +61,7 @@ CProfileTexts::CProfileTexts(const std::string& folder)
     if (StatusOf(packPath, packStatus) && packStatus.st_size < kPackByteLimit &&
         pack.Open(packPath) == EFailure::None)
     {
-        m_kPack = pack.Text(); // a copy: the file may be cut while its texts are in use
+        m_kPack = pack.Text(); // a copy, because the file can be truncated while its texts are in use
         packed = ReadPack(m_kPack);
     }
     for (const std::string& file : FilesInFolder(folder, ".prf"))

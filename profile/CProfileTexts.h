@@ -9,9 +9,9 @@
 
 namespace gw {
 
-/// The texts of all profiles in a folder, in name order, read once. An installation packs its profiles into
-/// one more file when it is built. A profile is taken from there as long as its own file has the packed size
-/// and is not newer than the pack; any other one is read from its own file.
+/// The texts of all profiles in a folder, in name order, read once. An installation also contains one file
+/// with all its profiles, created when it is built. A profile's text is read from there if its own file has
+/// the packed size and is not newer than the pack, otherwise from its own file.
 class CProfileTexts
 {
 public:
@@ -19,10 +19,10 @@ public:
     {
         std::string file;                     ///< in the folder
         std::string name;                     ///< display name; empty if the file cannot be read
-        std::optional<std::string_view> text; ///< empty if the file cannot be read or is too long
+        std::optional<std::string_view> text; ///< no value if the file cannot be read or is too long
     };
 
-    /// The folder ends in a separator.
+    /// `folder` ends in a separator.
     explicit CProfileTexts(const std::string& folder);
     CProfileTexts(const CProfileTexts&) = delete;
     CProfileTexts& operator=(const CProfileTexts&) = delete;
@@ -37,8 +37,8 @@ private:
     std::vector<Entry> m_kEntries;
 };
 
-/// The file of an installation that holds the texts of its profiles. For each, a line with its file name and
-/// its size in bytes, and then its bytes.
+/// The file in an installation with the texts of its profiles. For each, it has a line with file name and
+/// size in bytes, followed by the bytes.
 inline constexpr std::string_view kProfilePack = "profiles.pack";
 
 } // namespace gw

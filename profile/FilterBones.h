@@ -8,10 +8,11 @@ namespace gw {
 
 class CBoneTree;
 
-/// The bones whose name contains a text without regard to case: those that are still to be mapped first, each
-/// part in the order of the tree. An empty text is in every name.
+/// Returns the bones whose name contains a text, ignoring case: unmapped bones first, each part in tree
+/// order. An empty text matches every name.
 std::vector<int> FilterBones(const CBoneTree& tree, std::string_view text);
-/// The bones above a bone from the root on, as "Hips / Spine"; empty for a bone below the root of the tree.
+/// Returns the bones above a bone, starting at the root, as "Hips / Spine"; empty for a bone at the top of
+/// the tree.
 std::string BonePath(const CBoneTree& tree, int item);
 
 } // namespace gw

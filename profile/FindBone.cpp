@@ -41,13 +41,13 @@ CNode* CBoneNames::Find(std::string_view name) const
     return lower == m_kLowerCase.end() ? nullptr : lower->second;
 }
 
-// Most names are met as they are, so that this table waits for one that is not.
+// Most look-ups match exactly, so this table is built only when one does not.
 const CBoneNames::NodeOfName& CBoneNames::LowerCaseNames() const
 {
     if (m_kLowerCase.empty())
     {
         for (const std::string& name : m_kNames)
-            m_kLowerCase.try_emplace(LowerCase(name), m_kExact.at(name)); // the first of equal names stays
+            m_kLowerCase.try_emplace(LowerCase(name), m_kExact.at(name)); // the first of equal names wins
     }
     return m_kLowerCase;
 }

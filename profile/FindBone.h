@@ -9,18 +9,18 @@ namespace gw {
 
 class CNode;
 
-/// The bones of a skeleton by name, for many look-ups in a tree that does not change meanwhile. The nodes are
-/// looked at and not kept alive.
+/// Maps names to the bones of a skeleton, for many look-ups while the tree does not change. Nodes are not
+/// kept alive.
 class CBoneNames
 {
 public:
     /// A null root has no bones.
     explicit CBoneNames(CNode* root);
 
-    /// The first node with exactly this name in search order, else the first one that equals it without
-    /// regard to case, or null. Nodes without a name are never found.
+    /// Returns the first node, in search order, with exactly this name, otherwise the first one that matches
+    /// when ignoring case, or null. Nodes without a name are never found.
     CNode* Find(std::string_view name) const;
-    /// The distinct names, in search order.
+    /// Returns the distinct names, in search order.
     const std::vector<std::string>& Names() const { return m_kNames; }
 
 private:
@@ -29,11 +29,11 @@ private:
     const NodeOfName& LowerCaseNames() const;
 
     NodeOfName m_kExact;
-    mutable NodeOfName m_kLowerCase; ///< empty until it is asked for
+    mutable NodeOfName m_kLowerCase; ///< built when first needed
     std::vector<std::string> m_kNames;
 };
 
-/// The same for a single look-up.
+/// Same for a single look-up.
 CNode* FindBone(CNode* root, std::string_view name);
 
 } // namespace gw

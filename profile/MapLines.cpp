@@ -13,7 +13,7 @@ constexpr std::string_view kArrow = "<--->";
 constexpr std::string_view kPosition = "position";
 constexpr std::string_view kFrameRate = "framerate";
 
-// Three numbers between commas or blanks; what is missing is 0.
+// Parses three numbers separated by commas or blanks; missing ones are 0.
 Vec3 ParseThree(std::string_view text)
 {
     const auto next = [&text] { return static_cast<float>(ParseDouble(NextToken(text))); };
@@ -26,7 +26,7 @@ void ParseMapping(std::string_view text, MapLine& line)
     NextWord(text); // the arrow
     line.target = NextWord(text);
     const size_t begin = text.find_first_not_of(kTokenDelimiters);
-    // A dot stands where no rotation was given yet.
+    // A dot means that no rotation was set.
     line.hasRotation = begin != text.npos && text[begin] != '.';
     if (line.hasRotation)
         line.numbers = ParseThree(text);
@@ -45,7 +45,7 @@ MapLine ParseMapLine(std::string_view text)
     MapLine line;
     line.text = text;
     const std::string lower = LowerCase(text);
-    // What stands behind a keyword, wherever in the line it stands.
+    // Returns the text after a keyword, wherever it is in the line.
     const auto behind = [&](std::string_view keyword) {
         const size_t found = lower.find(keyword);
         return found == lower.npos ? std::string_view() : text.substr(found + keyword.size());
@@ -113,7 +113,7 @@ bool WriteMapLines(const std::string& path, std::span<const MapLine> lines)
     std::string text;
     for (const MapLine& line : lines)
         text.append(line.text).append(kLineEnd);
-    // What a first line begins with would be taken for the mark at the begin of a text, and be lost.
+    // If the first line starts with a byte order mark, readers would drop it.
     if (SkipByteOrderMark(text).size() < text.size())
         text.insert(0, text.substr(0, text.size() - SkipByteOrderMark(text).size()));
     CSafeFile file;

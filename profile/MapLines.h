@@ -10,7 +10,7 @@
 
 namespace gw {
 
-/// What a line of the older map syntax says.
+/// The kind of a line in the older map syntax.
 enum class EMapLine : uint8_t
 {
     Text,      ///< anything else, such as the name in the first line
@@ -20,32 +20,31 @@ enum class EMapLine : uint8_t
     Fixed,     ///< a target bone without a source: a line with a star and no arrow
 };
 
-/// One entry of the older map syntax: the line as it stands, and what it says. Only the members of its kind
-/// count.
+/// One line of the older map syntax: its text and its meaning. Only the members of its kind are used.
 struct MapLine
 {
     std::string text;
     EMapLine kind = EMapLine::Text;
     std::string source;
     std::string target;
-    bool hasRotation = false; ///< a mapping that was only added has none yet
+    bool hasRotation = false; ///< false for a mapping that was just added
     Vec3 numbers = kVec3Zero; ///< a mapping's rotation in degrees, or the root position
     int frameRate = 0;
 };
 
-/// Reads one line. Every text is a line of some kind.
+/// Parses a line. Every text is some kind of line.
 MapLine ParseMapLine(std::string_view text);
 
-// The lines as the map tool writes them. Numbers are cut to integers toward zero.
+// Lines as written by the map tool. Numbers are truncated toward zero.
 std::string PositionLine(const Vec3& position);
 std::string FrameRateLine(int frameRate);
 /// A mapping without a rotation.
 std::string MappingLine(std::string_view source, std::string_view target);
 std::string MappingLine(std::string_view source, std::string_view target, const Vec3& degrees);
 
-/// Reads all lines of a map or profile file. False, and lines left alone, when it cannot be read.
+/// Reads all lines of a map or profile file. Returns false, leaving `lines` unchanged, if it cannot be read.
 bool ReadMapLines(const std::string& path, std::vector<MapLine>& lines);
-/// Replaces a file by the lines' texts. False leaves an old file as it was.
+/// Replaces a file by the lines' texts. Returns false, keeping an old file, if that fails.
 bool WriteMapLines(const std::string& path, std::span<const MapLine> lines);
 
 } // namespace gw

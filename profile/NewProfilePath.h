@@ -6,8 +6,7 @@ namespace gw {
 
 class CProfileOwner;
 
-/// A path for a new profile of the user's that no file or folder has yet; the last one of all where every
-/// number is taken.
+/// Returns an unused path for a new custom profile, or the last candidate if all numbers are used.
 std::string NewProfilePath(CProfileOwner& owner);
 
 } // namespace gw

@@ -1,3 +1,7 @@
+// Profiles are read as the oldest reader did: lines of up to 1024 characters, tokens of up to 255, and
+// missing tokens keep the value from the previous line. Maps in use depend on these rules, so they are part
+// of the format.
+
 #include "ProfileFile.h"
 
 #include "CMapRowTable.h"
@@ -14,12 +18,12 @@ namespace gw {
 
 namespace {
 
-// A longer line is read as several.
+// A longer line is read as several lines.
 constexpr size_t kLineLimit = 1024;
-// Tokens live in buffers of 256 characters, their end mark included.
+// Token buffers have 256 characters, including the terminator.
 constexpr size_t kTokenLimit = 255;
 
-// The next of up to six integers: behind a comma, which must not stand first in what is left.
+// Reads the next of up to six integers: it follows a comma, which must not be the first character left.
 bool NextInList(std::string_view& rest, int& number)
 {
     const size_t comma = rest.find(',');
@@ -30,7 +34,7 @@ bool NextInList(std::string_view& rest, int& number)
     return true;
 }
 
-// "rx,ry,rz,ax,ay,az", or ".ax,ay,az". Numbers that are not there keep their defaults.
+// Parses "rx,ry,rz,ax,ay,az", or ".ax,ay,az". Missing numbers keep their defaults.
 RowNumbers ParseNumbers(std::string_view text)
 {
     RowNumbers numbers;
@@ -96,7 +100,7 @@ bool ReadProfileText(const std::string& path, std::string& text)
 
 int CutToInteger(float value)
 {
-    constexpr float kBeyond = 2147483648.0f; // the first float that no int holds
+    constexpr float kBeyond = 2147483648.0f; // the first float that does not fit into an int
     if (std::isnan(value))
         return 0;
     if (value >= kBeyond)
@@ -111,7 +115,7 @@ CProfileReader::CProfileReader(std::string_view text) : m_kRest(SkipByteOrderMar
         m_kName = CutTrailing(name);
 }
 
-// Takes up to kLineLimit characters of a line. A zero byte ends them, as it ends any text.
+// Reads up to kLineLimit characters of a line. A zero byte ends them, as it ends any text.
 bool CProfileReader::NextPiece(std::string_view& piece)
 {
     if (m_kRestOfLine.empty())

@@ -13,13 +13,13 @@ namespace gw {
 
 class CMapRowTable;
 
-/// Stands in the source column of a row whose target bone takes no source.
+/// The source column of a row whose target bone has no source.
 inline constexpr std::string_view kFixedSource = "[FIXED]";
 
-/// The most bytes that a profile may have; a full skeleton takes a fiftieth of this.
+/// The maximum size of a profile; a full skeleton takes a fiftieth of it.
 inline constexpr size_t kProfileByteLimit = 262'144;
 
-/// The platform's line end, which ends every line that is written.
+/// The platform's line end, used for every written line.
 inline constexpr std::string_view kLineEnd =
 #ifdef _WIN32
     "\r\n";
@@ -27,14 +27,14 @@ inline constexpr std::string_view kLineEnd =
     "\n";
 #endif
 
-/// The display name of a profile: the first line of its file, cut at the end. Empty when the file cannot be
-/// read.
+/// Returns the display name of a profile: the first line of its file, trimmed at the end. Empty if the file
+/// cannot be read.
 std::string ReadProfileName(const std::string& path);
 
-/// The bytes of a profile. False when the file cannot be read or is longer than a profile can be.
+/// Reads the bytes of a profile. Returns false if the file cannot be read or exceeds the limit.
 bool ReadProfileText(const std::string& path, std::string& text);
 
-/// What a row says beside its two names.
+/// The numbers of a row.
 struct RowNumbers
 {
     std::array<int, 3> rotation{}; ///< X, Y, Z in degrees
@@ -51,20 +51,20 @@ enum class EProfileLine : uint8_t
     Mapping, ///< a source bone that drives a target bone
 };
 
-/// One line of a profile behind the first. Only the members of its kind say something.
+/// A line of a profile after the first. Only the members of its kind are used.
 struct ProfileLine
 {
     EProfileLine kind = EProfileLine::Mapping;
-    size_t line = 0; ///< in the file, from 1 on
+    size_t line = 0; ///< in the file, starting at 1
     Vec3 position = kVec3Zero;
     int frameRate = 0;
-    std::string source; ///< kFixedSource in a fixed row
+    std::string source; ///< kFixedSource for a fixed row
     std::string target;
     RowNumbers numbers;
 };
 
-/// Reads the text of a profile line by line. Never fails: a line with too few tokens takes the missing ones
-/// from the line before, and one that fits no other kind is a mapping row.
+/// Reads the text of a profile line by line. It never fails: a line with too few tokens uses those of the
+/// previous line for the missing ones, and a line of no other kind is a mapping row.
 class CProfileReader
 {
 public:
@@ -72,7 +72,7 @@ public:
     explicit CProfileReader(std::string_view text);
 
     const std::string& Name() const { return m_kName; }
-    /// False at the end of the file.
+    /// Returns false at the end of the file.
     bool Next(ProfileLine& line);
 
 private:
@@ -88,12 +88,10 @@ private:
     size_t m_uiLine = 0;
 };
 
-/// A decimal number cut to an integer toward zero; one that no integer can hold is the nearest end, none is
-/// 0.
+/// Returns a number truncated to an integer, clamped to its range; 0 for NaN.
 int CutToInteger(float value);
 
-/// The whole text of a profile file. The name is written as it is; the position is cut to integers toward
-/// zero.
+/// Returns the text of a profile file. The name is written unchanged; the position is truncated to integers.
 std::string ProfileText(std::string_view name, int frameRate, const Vec3& position, const CMapRowTable& rows);
 
 } // namespace gw

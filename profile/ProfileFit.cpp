@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// A profile with more bones that are missing belongs to another skeleton, and comparing names takes time.
+// A profile with more missing bones belongs to another skeleton, and comparing names takes time.
 constexpr size_t kNearestLimit = 100;
 
 bool Has(const CBoneNames& bones, const std::string& name, ESkeletonSide side, int row, CProfileFit& fit)
@@ -21,7 +21,7 @@ bool Has(const CBoneNames& bones, const std::string& name, ESkeletonSide side, i
     return false;
 }
 
-// The rows as loading the file would leave them, and the line that each came from.
+// Returns the rows as loading the file would leave them, and the line of each.
 CMapRowTable ReadRows(CProfileReader& reader, std::vector<size_t>& lines)
 {
     CMapRowTable rows;

@@ -16,34 +16,32 @@ enum class ESkeletonSide : uint8_t
     Target,
 };
 
-/// A bone that a row of a profile names and that its skeleton does not have.
+/// A bone that a profile names but the skeleton lacks.
 struct MissingBone
 {
     ESkeletonSide side = ESkeletonSide::Source;
     std::string name;
-    std::string nearest; ///< the most similar name in that skeleton, or empty where none is similar; for the
-                         ///< first 100
+    std::string nearest; ///< the most similar name in that skeleton, or empty; for the first 100 only
     int row = 0;         ///< in the row table
-    size_t line = 0;     ///< in the file, from 1 on; 0 for rows of no file
+    size_t line = 0;     ///< in the file, starting at 1; 0 for rows without a file
 };
 
-/// How a profile fits two skeletons, as applying it would find.
+/// How a profile fits two skeletons, without applying it.
 struct CProfileFit
 {
     std::string name;        ///< display name
-    int rowCount = 0;        ///< one for each target bone, fixed ones included
-    int foundCount = 0;      ///< rows whose bones are there
-    bool drivesRoot = false; ///< a source bone that is there drives the target's root bone
+    int rowCount = 0;        ///< one per target bone, fixed ones included
+    int foundCount = 0;      ///< rows whose bones exist
+    bool drivesRoot = false; ///< an existing source bone drives the target's root bone
     std::vector<MissingBone> missing;
 
-    /// Whether a conversion accepts the profile.
+    /// Returns whether a conversion accepts the profile.
     bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
 };
 
-/// Measures how the rows of a table fit. Null roots have no bones.
+/// Returns how the rows of a table fit. A null root has no bones.
 CProfileFit MeasureFit(const CMapRowTable& rows, CNode* sourceRoot, CNode* targetRoot);
-/// The same for the rows that loading a file would give. False, and the fit left alone, when it cannot be
-/// read.
+/// Same for the rows of a file. Returns false, leaving `fit` unchanged, if it cannot be read.
 bool MeasureFit(const std::string& path, CNode* sourceRoot, CNode* targetRoot, CProfileFit& fit);
 
 } // namespace gw

@@ -11,10 +11,10 @@ namespace {
 
 using Names = std::vector<std::string>;
 
-// As many digits as can be counted up without leaving 32 bits.
+// As many digits as can be incremented within 32 bits.
 constexpr size_t kDigitLimit = 9;
 
-// Cuts "(7)" off the end of a name and answers 7; 0 for a name that ends otherwise.
+// Removes "(7)" from the end of a name and returns 7; 0 if there is no number.
 int CutNumber(std::string_view& name)
 {
     const size_t open = name.rfind('(');
@@ -28,8 +28,7 @@ int CutNumber(std::string_view& name)
     return ParseInt(digits);
 }
 
-// A long name gives up letters for the number, since a name over the limit would be refused as a new one
-// later.
+// A long name is shortened to make room for the number, because a name over the limit would later be refused.
 std::string Numbered(std::string_view base, int number)
 {
     const std::string ending = '(' + std::to_string(number) + ')';
@@ -64,7 +63,7 @@ std::string NextFreeName(std::string_view name, const Names* inUse)
     std::string_view base = CutTrailing(name);
     int number = CutNumber(base);
     std::string next;
-    // Each number gives another name, so at most one more than there are names is tried.
+    // Each number yields another name, so this ends after at most one more try than there are names.
     do
         next = Numbered(base, ++number);
     while (IsNameInUse(next, inUse));

@@ -1,4 +1,4 @@
-// Undo and redo in the profile editor: the present profile as a state, and back.
+// Undo and redo in the profile editor: saving the current profile as a state, and restoring it.
 
 #include "CProfileEditorDialog.h"
 
@@ -38,7 +38,7 @@ void CProfileEditorDialog::Restore(const CProfileState& state)
     UpdateButtons();
 }
 
-// A row marks its bones only where both are there, as it does when it is loaded.
+// A row marks its bones only if both exist, as when it is loaded.
 void CProfileEditorDialog::MarkAllRows(bool mapped)
 {
     for (int row = 0; row < m_kRows.RowCount(); ++row)

@@ -4,7 +4,7 @@
 // With ECommit::InTurn, a run that stops at its first failure must leave exactly the files that a sequential
 // run would leave, however many processes work ahead. So a worker with a finished result asks before its file
 // takes its place, and gets permission when all earlier jobs have succeeded. While it waits it uses no core,
-// so another process is started in its place, up to kAhead per core.
+// so another process is started in its place, up to kAhead per active worker.
 //
 // This cannot deadlock: the earliest unfinished job never waits for another one, and a job that hangs is
 // killed after its time limit.

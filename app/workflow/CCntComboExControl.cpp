@@ -22,7 +22,7 @@ void CProfileList::DeleteItem(int index)
     if (!Has(index))
         return;
     m_kItems.erase(m_kItems.begin() + index);
-    // The entry that slid into the place of a selected one is selected, or the one that is last now.
+    // Selects the entry that moved into the place of a deleted selected one, or the last one.
     if (m_iSelected > index || !Has(m_iSelected))
         --m_iSelected;
 }

@@ -12,21 +12,21 @@ public:
     virtual ~CCntComboExControl() = default;
 
     virtual void AddItem(const std::string& text, int userData) = 0;
-    /// Deletes one entry, or with -1 all.
+    /// Deletes one entry, or all with -1.
     virtual void DeleteItem(int index) = 0;
-    /// The selected index, or -1.
+    /// Returns the selected index, or -1.
     virtual int GetCurSel() const = 0;
-    /// Selects without the notification that a choice by hand gives; -1 selects none.
+    /// Selects an entry without the notification of a user's choice; -1 selects none.
     virtual void SetCurSel(int index) = 0;
-    /// The text of an entry, valid until the list changes; null for an index out of range.
+    /// Returns the text of an entry, valid until the list changes; null for an index out of range.
     virtual const std::string* GetItemText(int index) const = 0;
     virtual int GetItemUserData(int index) const = 0;
-    /// The font of the field and of the open list: a family, and the size of each in tenths of a point. A
-    /// size of 0 or below leaves the size as it is. Does nothing if no text is shown.
+    /// Sets the font of the field and of the open list: a family, and each size in tenths of a point. A size
+    /// of 0 or below keeps the current size. Does nothing if no text is shown.
     virtual void SetFont(const std::string&, int, int) {}
 };
 
-/// The list by itself, with nothing on a screen. A window may show it after every change.
+/// The list alone, without a display. A window can show it after every change.
 class CProfileList : public CCntComboExControl
 {
 public:

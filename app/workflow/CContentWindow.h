@@ -14,32 +14,31 @@ namespace gw {
 class CBoneOffsetDialog;
 class CCntComboExControl;
 
-/// What an open or save dialog begins with. A filter is pairs of text and pattern, "|" after each, "||" at
-/// the end.
+/// The initial state of an open or save dialog. A filter consists of pairs of text and pattern, each followed
+/// by "|", with "||" at the end.
 struct FileDialogSetup
 {
     std::string defaultExtension; ///< without dot
     std::string filter;
-    std::string initialFolder; ///< empty for the system's own choice
+    std::string initialFolder; ///< empty for the system's default
 };
 
-/// A folder that was chosen, with its trailing separator, and the number of the filter chosen with it, from 1
-/// on.
+/// A selected folder, with trailing separator, and the number of the filter selected with it, starting at 1.
 struct FolderChoice
 {
     std::string folder;
     int filterIndex = 1;
 };
 
-/// The keys whose state is asked for. The left ones only: the right ones have no say.
+/// The keys that can be queried. Only the left ones; the right ones are ignored.
 enum class EKey
 {
     LeftCtrl,
     LeftShift,
 };
 
-/// The window as the workflow sees it. The desktop window is one implementation, the tests another that
-/// answers from a script. Children are known by name. What needs no answer has a body here that does nothing.
+/// The window as seen by the workflow. The desktop window is one implementation; tests use another with
+/// scripted answers. Children are identified by name. Functions without a result have an empty default.
 class CContentWindow
 {
 public:
@@ -47,67 +46,67 @@ public:
 
     // Questions
 
-    /// Shows a text until it is answered. The id is that of the message.
+    /// Shows a text until it is answered. `id` is the message's.
     virtual EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) = 0;
-    /// A path, or none when the dialog was cancelled.
+    /// Returns a path, or nothing if the dialog was canceled.
     virtual std::optional<std::string> AskOpenFile(const FileDialogSetup& setup) = 0;
-    /// The same; the dialog itself asks before a file is replaced.
+    /// Same for saving; the dialog itself asks before a file is replaced.
     virtual std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) = 0;
     virtual std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) = 0;
     virtual bool IsKeyDown(EKey) const { return false; }
 
-    // Words and progress
+    // Messages and progress
 
-    /// Why something failed, or a warning. Comes before the fixed message of the same failure, if it has one.
+    /// Reports a failure or warning. Called before the fixed message of the same failure, if it has one.
     virtual void Report(const CReport&) {}
-    /// Whether a person looks at what is reported, so that a doubtful file is examined in full.
+    /// Returns whether a person sees the reports, so that a doubtful file is examined in full.
     virtual bool ShowsFindings() const { return false; }
-    /// Whether an operation has run so long that its user should see how far it is.
+    /// Returns whether an operation has taken long enough to show its progress.
     virtual bool IsProgressDue() { return false; }
-    /// Paints what is due, in the midst of an operation: no key, no click and no timer comes through.
+    /// Repaints during an operation, without handling keys, clicks or timers.
     virtual void StayPainted() {}
     virtual void BeginWaitCursor() {}
     virtual void EndWaitCursor() {}
-    /// Draws the window at once, where a dialog has left its mark.
+    /// Redraws the window immediately, after a dialog has covered it.
     virtual void RedrawFrame() {}
     virtual void PostCloseRequest() {}
 
     // Children
 
     virtual void EnableChild(std::string_view, bool) {}
-    /// The picture of a button: 0 as it is, 1 the other one.
+    /// Sets the picture of a button: 0 for the normal one, 1 for the other.
     virtual void SetChildFace(std::string_view, int) {}
     virtual void SetChildSecondState(std::string_view, bool) {}
     virtual void SetChildButtonState(std::string_view, bool) {}
     virtual bool GetChildButtonState(std::string_view) const { return false; }
     virtual void SetChildScrollRange(std::string_view, int, int) {}
     virtual void SetChildScrollValue(std::string_view, int) {}
-    /// Shows a text at once, also while an operation blocks the window.
+    /// Shows a text immediately, even while an operation blocks the window.
     virtual void SetChildText(std::string_view, const std::string&) {}
-    /// The view inside an image child, or null where there is none.
+    /// Creates the view inside an image child; null if it has none.
     virtual std::unique_ptr<CMotionView> CreateView(std::string_view) { return nullptr; }
-    /// Makes the list of profiles on two children, a field and an arrow, with a font size in tenths of a
-    /// point. The window owns the list; choices by hand go to OnCntCommand.
+    /// Creates the list of profiles on two children, a field and an arrow, with a font size in tenths of a
+    /// point. The window owns the list; choices by the user go to OnCntCommand.
     virtual CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow,
                                               int fontSize) = 0;
-    /// Ticks until it is killed; setting a timer that runs sets its period anew.
+    /// Starts a timer that runs until it is killed; a running timer gets the new period.
     virtual void SetTimer(int, int) {}
     virtual void KillTimer(int) {}
 
-    // The profile editor's dialog, which shows what the editor's model answers
+    // The profile editor's dialog, which displays the editor's model
 
     virtual void ShowProfileEditor(bool) {}
-    /// The editor's model changed: rows, trees, fields, buttons or whether it is visible.
+    /// The editor's model has changed: rows, trees, fields, buttons or visibility.
     virtual void RefreshProfileEditor() {}
-    /// Shows the offset dialog until the user ends it: true on OK.
+    /// Shows the offset dialog until the user ends it; returns true on OK.
     virtual bool RunBoneOffset(CBoneOffsetDialog&) { return false; }
 
-    // The desktop around it
+    // The desktop environment
 
     virtual void ShowInFileManager(const std::string&) {}
-    /// Opens a topic of a help file: the file's path with the topic behind it.
+    /// Opens a topic of a help file: the path followed by the topic.
     virtual void OpenHelpFile(const std::string&) {}
-    /// Whether the system took the address.
+    /// Returns whether the system accepted the address.
     virtual bool OpenWebPage(const std::string&) { return false; }
 };
 

@@ -45,7 +45,7 @@ bool CFileConversion::LoadSource(const std::string& path)
     if (!isScene_)
         sourceRecord_ = motion_.Record();
     else if (loaded)
-        AttachBoneMeshes(SourceRoot()); // which tell how the bones point, as those of motion files do
+        AttachBoneMeshes(SourceRoot()); // as for motion files, because they define the bones' directions
     Report(path, sourceRecord_);
     if (!loaded)
         TellMessage(kInvalidSourceMessage);
@@ -87,7 +87,7 @@ void CFileConversion::UseProfile(const std::string& path, const ProfileRows& pro
     profilePath_ = path;
 }
 
-// A container may say that it ends before it begins.
+// A container can claim to end before it begins.
 bool CFileConversion::HasFrames() const
 {
     const bool hasFrames = (isScene_ || motion_.GetKeyCount() > 0) && result_.GetKeyCount() > 0;
@@ -96,7 +96,7 @@ bool CFileConversion::HasFrames() const
     return hasFrames;
 }
 
-// A number outside its limits counts all the same.
+// A number outside its limits is used anyway.
 void CFileConversion::WarnOfNumbers() const
 {
     const auto warn = [&](int number, int low, int high, size_t line, const std::string& name) {
@@ -117,7 +117,7 @@ void CFileConversion::WarnOfNumbers() const
          "FrameRate " + std::to_string(profile_.frameRate));
 }
 
-// Fills a new retargeter's tables from the profile.
+// Fills the tables of a new retargeter from the profile.
 bool CFileConversion::Prepare(EAlignedJoints joints)
 {
     CNode* const source = SourceRoot();

@@ -55,7 +55,7 @@ bool CGaitConvertContent::ConfirmDiscard()
         return true;
     const EAnswer answer = ShowMessage(kSaveResultMessage, EButtons::YesNoCancel);
     if (answer == EAnswer::Yes)
-        return SaveResult() != 0; // always: whoever then cancels the save dialog loses the result
+        return SaveResult() != 0; // always true: a user who cancels the save dialog loses the result
     return answer == EAnswer::No;
 }
 
@@ -113,13 +113,13 @@ int CGaitConvertContent::Open(const std::string& path)
     if (m_pkProfile)
         m_pkProfile->ApplyProfile(nullptr, nullptr, nullptr);
     UpdateControls();
-    // Only now, so that "apply" keeps the state of the result before until the next update.
+    // Only here, so that "apply" keeps the previous result's state until the next update.
     m_bConverted = false;
     m_bSaved = false;
     return 1;
 }
 
-// A motion file leaves the container flag as it stands: once a container has been open, its scene stays the
+// A motion file does not reset the container flag: after a container has been opened, its scene remains the
 // source.
 bool CGaitConvertContent::LoadSource(const std::string& path)
 {
@@ -139,8 +139,7 @@ bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& pat
     return loaded;
 }
 
-// Shows the source that was loaded, takes the target skeleton twice and hands all three to the profile
-// editor.
+// Shows the loaded source, loads the target skeleton twice, and passes all three to the profile editor.
 void CGaitConvertContent::ShowSource()
 {
     CNode* const root = SourceRoot();

@@ -26,12 +26,12 @@ class CCntComboExControl;
 class CContentWindow;
 class CProfileEditorDialog;
 
-/// The playbar's last value; the whole motion lies between 0 and this.
+/// The playbar's last value; 0 to this value covers the whole motion.
 inline constexpr int kScrollRange = 256;
 
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
-/// come in by child name, requests go out through the two ports. Operations that answer a number answer 0
-/// when they failed and 1 otherwise, also when a dialog was cancelled.
+/// arrive by child name, requests go out through the two ports. Operations that return a number return 0 on
+/// failure and 1 otherwise, also if a dialog was canceled.
 class CGaitConvertContent : public CProfileOwner
 {
 public:
@@ -41,38 +41,37 @@ public:
     CGaitConvertContent(const CGaitConvertContent&) = delete;
     CGaitConvertContent& operator=(const CGaitConvertContent&) = delete;
 
-    /// Makes the views, the profile list and the profile editor; call it once, before everything else. False
-    /// if the window has no view; the rest works without one.
+    /// Creates the views, the profile list and the profile editor. Call it once, before everything else.
+    /// Returns false if the window has no view; the rest works without one.
     bool OnInitContent();
 
     // The workflow
 
-    /// The command of a clicked child. True when the click is to be passed on to the window's own handling.
+    /// Runs the command of a clicked child. Returns true if the window should handle the click as well.
     bool ChildClick(std::string_view child);
     int OpenSource();
-    /// What OpenSource does once a path was chosen: a file of the recent ones, or of the command line.
+    /// Opens a path like OpenSource after the dialog: a recent file, or one from the command line.
     int OpenFile(const std::string& path);
-    /// What was dropped on the window: a motion opens, a folder offers a batch run, a profile is selected.
+    /// Handles a drop on the window: opens a motion, offers a batch run for a folder, selects a profile.
     int OpenDropped(const std::string& path);
     int ConvertMotion();
     int SaveResult();
-    /// The dialog begins in a folder; an empty one means that of the last source.
+    /// The dialog starts in a folder; empty means the last source's.
     int RunBatch(const std::string& initialFolder = {});
-    /// What conversions from now on do beside the rules.
+    /// Sets the options of future conversions.
     void SetChoices(const ConversionChoices& choices);
     const ConversionChoices& Choices() const { return m_kChoices; }
-    /// The result, written and packaged as the path's extension says. Replaces what is there. False when
-    /// nothing was written, or where the package could not be made; what the fixed answers do not tell is
-    /// reported.
+    /// Writes the result, packaged if the extension is .Kinetra, replacing an existing file. Returns false if
+    /// nothing was written or packaging failed; details that the fixed messages do not contain are reported.
     bool WriteResult(const std::string& path);
-    /// Whether the present result may be dropped; asks when it is not saved.
+    /// Returns whether the current result may be discarded; asks if it is not saved.
     bool ConfirmDiscard();
-    /// Asks the editor, then for the result: whether the window may close.
+    /// Asks the editor and then about the result; returns whether the window may close.
     bool MayClose();
-    /// Brings the enabled state of every child up to date.
+    /// Updates the enabled state of every child.
     void UpdateControls();
 
-    // Playback: what the window's timers and its scroll bar deliver
+    // Playback: events from the window's timers and its scroll bar
 
     void OnTimer(int id);
     void ChildMouseDown(std::string_view child);
@@ -81,15 +80,15 @@ public:
 
     // Profiles
 
-    /// A notification of the profile list; code 9 is a choice by hand.
+    /// Handles a notification of the profile list; code 9 is a choice by the user.
     void OnCntCommand(int code);
     void DeleteSelectedProfile();
     void RefreshProfileList();
-    /// Reads the display names of the two stock profiles, by which PickStockProfile selects them.
+    /// Reads the display names of the two stock profiles, which PickStockProfile uses.
     void KeepStockNames();
     void PruneProfileList();
     void SelectProfileByName(const std::string& name);
-    /// Loads a profile that need not be in the list, as if it had been chosen there.
+    /// Loads a profile that need not be in the list, as if it had been selected there.
     void UseProfileFile(const std::string& path);
     void PickStockProfile();
 
@@ -101,28 +100,28 @@ public:
     std::string ExeFile(const std::string& name) override;
     bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
 
-    /// Drafts a profile for the open source, keeps it among the user's and shows it in the editor.
+    /// Drafts a profile for the open source, saves it with the user's and shows it in the editor.
     int DraftProfile();
 
     // Help
 
-    /// The host product's executable; says so when there is none.
+    /// Finds the host product's executable; shows a message if it is not installed.
     bool LocateHost(std::string& path);
-    /// The host product's help file; true with an empty path when its library names none.
+    /// Finds the host product's help file; returns true with an empty path if its library names none.
     bool LocateHelp(std::string& path);
     void ShowHelp();
 
-    // What stands
+    // State
 
-    /// The text of a message; see CResourceManager.
+    /// Returns the text of a message; see CResourceManager.
     std::string Message(int id) const;
-    /// The window's title: the product's name, and behind it a text if there is one.
+    /// Sets the window's title: the product's name, followed by `text` unless it is empty.
     void SetTitle(const std::string& text);
     CBoneMapProfile* Profile() const { return m_pkProfile; }
-    /// The sources that were opened last, the newest first.
+    /// Returns the recently opened sources, newest first.
     std::vector<std::string> RecentFiles() const;
     CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
-    /// The root of the open source, be it a motion file's or a container's; null when nothing is open.
+    /// Returns the root of the open source, motion file or container; null if nothing is open.
     CNode* SourceRoot() const;
     const CMotionFile& ResultMotion() const { return m_kResultMotion; }
     bool IsConverted() const { return m_bConverted; }
@@ -200,24 +199,24 @@ private:
     bool m_bSourceIsContainer = false; ///< once set, only a batch conversion clears it
     COrrinStream m_spkSourceScene;     ///< a source read from a container
     CMotionFile m_kSourceMotion;
-    std::string m_kSourcePath;             ///< of the file that was opened last
-    CMotionFile m_kBaseMotion;             ///< base.htr as it is, for the editor's target tree
+    std::string m_kSourcePath;             ///< of the last opened file
+    CMotionFile m_kBaseMotion;             ///< base.htr unchanged, for the editor's target tree
     CMotionFile m_kResultMotion;           ///< base.htr again, into which the motion is baked
-    std::optional<FileStamp> resultStamp_; ///< of base.htr as read; null once the result was baked or posed
+    std::optional<FileStamp> resultStamp_; ///< of base.htr when read; null once the result was baked or posed
     std::optional<CRetargeter> m_kRetargeter; ///< new for each conversion
     std::unique_ptr<CMotionView> m_pkSourceView;
     std::unique_ptr<CMotionView> m_pkResultView;
-    std::string m_kProfilePath;      ///< of the profile selected in the list; empty means none
+    std::string m_kProfilePath;      ///< of the selected profile; empty if none
     std::string m_kPoserProfileName; ///< display name of PoserBVH.prf when the list was last filled
-    std::string m_kMaxProfileName;   ///< the same of MaxBVH.prf
-    CCntComboExControl* m_pkProfileCombo = nullptr; ///< the profile list, which the window owns
+    std::string m_kMaxProfileName;   ///< same for MaxBVH.prf
+    CCntComboExControl* m_pkProfileCombo = nullptr; ///< the profile list, owned by the window
     std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
-    std::string m_kTitle;                           ///< what SetTitle was given last
+    std::string m_kTitle;                           ///< last text passed to SetTitle
     ConversionChoices m_kChoices;
-    bool m_bConverted = false;              ///< a conversion has been made for the open source
-    bool m_bSaved = true;                   ///< the result has been saved, or there was none
+    bool m_bConverted = false;              ///< the open source has been converted
+    bool m_bSaved = true;                   ///< the result has been saved, or there is none
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's
-    CFailureRecord m_kWriteRecord;          ///< what the last WriteResult failed on
+    CFailureRecord m_kWriteRecord;          ///< failures of the last WriteResult
 };
 
 } // namespace gw

@@ -5,16 +5,16 @@
 
 namespace gw {
 
-/// One thing that the fixed messages do not say: why an operation failed, or what a user should know although
-/// it did not.
+/// Something that the fixed messages do not contain: why an operation failed, or what a user should know
+/// although it succeeded.
 struct CReport
 {
     bool warning = false;
     std::string path;  ///< the file concerned, or empty
-    size_t where = 0;  ///< line from 1 on of a text, byte of a container; 0 where there is none
+    size_t where = 0;  ///< line of a text, starting at 1, or byte of a container; 0 if unknown
     std::string code;  ///< a short fixed word for programs: "blank-line"
-    std::string name;  ///< bone, keyword, class or text concerned, as it stands in the file
-    std::string words; ///< a sentence for people, with the remedy where there is one; safe to print
+    std::string name;  ///< bone, keyword, class or text concerned, as written in the file
+    std::string words; ///< a sentence for people, with the remedy if there is one; safe to print
 };
 
 } // namespace gw

@@ -2,7 +2,7 @@
 
 namespace gw {
 
-/// Shows a window's wait cursor for as long as it lives.
+/// Shows a window's wait cursor while it exists.
 template <class TWindow>
 class CWaitCursor
 {

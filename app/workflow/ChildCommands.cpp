@@ -1,4 +1,4 @@
-// What the window's children, timers and scroll bar do.
+// The commands of the window's children, timers and scroll bar.
 
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
@@ -9,8 +9,8 @@ namespace gw {
 
 namespace {
 
-// The clock of both views, and the watch over the result view's buttons. The second never moves a picture:
-// what "play1" plays runs only while the first timer runs as well.
+// The clock of both views, and the timer that updates the result view's buttons. The second never moves a
+// picture: after "play1", the motion runs only while the first timer runs as well.
 constexpr int kClockTimer = 0;
 constexpr int kClockMilliseconds = 17;
 constexpr int kResultTimer = 1;
@@ -24,7 +24,7 @@ struct CGaitConvertContent::Command
 {
     std::string_view m_kChild;
     void (CGaitConvertContent::*m_pkRun)();
-    bool m_bPassOn; // whether the window's own handling of the click follows
+    bool m_bPassOn; // the window also handles the click itself
 };
 
 void CGaitConvertContent::ForViews(void (CMotionView::*operation)())
@@ -36,7 +36,7 @@ void CGaitConvertContent::ForViews(void (CMotionView::*operation)())
     }
 }
 
-// Runs an operation whose answer a click does not need.
+// Runs an operation and ignores its result.
 template <auto Operation>
 void CGaitConvertContent::Run()
 {
@@ -58,7 +58,7 @@ void CGaitConvertContent::OnResultView()
     UpdateControls();
 }
 
-// "PreFrm1" and "NextFrm1" have no rows: the two buttons light up and do nothing.
+// "PreFrm1" and "NextFrm1" have no rows: these two buttons light up and do nothing.
 bool CGaitConvertContent::ChildClick(std::string_view child)
 {
     using Content = CGaitConvertContent;
@@ -98,7 +98,7 @@ void CGaitConvertContent::RequestClose()
     window_.PostCloseRequest();
 }
 
-// The left Ctrl key at the click is the only way to a batch conversion.
+// Holding the left Ctrl key during the click is the only way to start a batch conversion.
 void CGaitConvertContent::OpenSourceOrRunBatch()
 {
     if (window_.IsKeyDown(EKey::LeftCtrl))
@@ -152,7 +152,7 @@ void CGaitConvertContent::OnTimer(int id)
 void CGaitConvertContent::ChildMouseDown(std::string_view child)
 {
     if (EqualNoCase(child, kPlaybar))
-        window_.KillTimer(kClockTimer); // so that the clock does not pull at what the hand drags
+        window_.KillTimer(kClockTimer); // so that the clock does not compete with the dragging user
 }
 
 void CGaitConvertContent::ChildMouseUp(std::string_view child)

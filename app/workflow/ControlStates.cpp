@@ -1,4 +1,4 @@
-// Which child is enabled when. Every condition is a bit, so that a child's row names what it needs.
+// Which child is enabled when. Each condition is a bit, and a child's row lists the bits that it needs.
 
 #include "CBoneMapProfile.h"
 #include "CCntComboExControl.h"
@@ -15,12 +15,12 @@ namespace {
 
 enum EFact : uint32_t
 {
-    kSource = 1 << 0, // there is a source with keys, or one from a container
+    kSource = 1 << 0, // a source with keys, or one from a container, is open
     kSourcePlays = 1 << 1,
     kSourceMoved = 1 << 2, // its view is not at the start
     kSourceAhead = 1 << 3, // its view is before the end
     kSourceLong = 1 << 4,  // it has more than one frame, or is from a container
-    kBase = 1 << 5,        // the target skeleton is there
+    kBase = 1 << 5,        // the target skeleton is loaded
     kConverted = 1 << 6,
     kResult = 1 << 7, // converted, with keys
     kResultPlays = 1 << 8,
@@ -29,7 +29,7 @@ enum EFact : uint32_t
     kResultAhead = 1 << 11,
     kProfilePath = 1 << 12, // the selected profile has a file
     kSelection = 1 << 13,   // the list has a selection
-    kRemovable = 1 << 14,   // it is a custom profile of a listed name
+    kRemovable = 1 << 14,   // it is a custom profile with a listed name
 };
 
 struct Row
@@ -58,7 +58,7 @@ constexpr Row kControls[] = {
     {"|playbar", kSourceLong                   },
 };
 
-// A view's clock; one that does not exist rests at the start of nothing.
+// A view's clock; a missing one is at the start of an empty motion.
 struct Clock
 {
     explicit Clock(const CMotionView* view)
@@ -80,7 +80,7 @@ uint32_t When(bool holds, uint32_t fact)
     return holds ? fact : 0;
 }
 
-// A motion without keys may name a last frame below 0.
+// A motion without keys can have a negative last frame.
 bool HasSeveralFrames(const CMotionFile& motion)
 {
     return motion.GetKeyCount() > 0 && motion.GetLastFrame() != 0.0f;
@@ -94,7 +94,8 @@ int ScrollValue(const Clock& clock)
     return static_cast<int>(std::lround(std::clamp(value, 0.0f, static_cast<float>(kScrollRange))));
 }
 
-// Where a view stands: frame, last frame and seconds. A view's step is one over the frame time.
+// Returns a view's position: frame, last frame and seconds. A view's step is the reciprocal of the frame
+// time.
 std::string PlaceText(const CMotionView* view)
 {
     if (!view || !(view->GetFrameStep() > 0.0f) || !(view->GetLastFrame() > 0.0f))
@@ -154,7 +155,7 @@ void CGaitConvertContent::SetChoices(const ConversionChoices& choices)
     UpdateControls();
 }
 
-// What is on can be seen without opening the menu.
+// Active options are visible without opening the menu.
 void CGaitConvertContent::ShowChoices()
 {
     std::string text = m_kChoices.align ? "aligned" : "";

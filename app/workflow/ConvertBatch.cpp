@@ -1,4 +1,5 @@
-// One folder, every file of a kind, no questions: sources to HTR files, or HTR files to containers.
+// Converts every file of a kind in one folder, without questions: sources to HTR files, or HTR files to
+// containers.
 
 #include "CBoneMapProfile.h"
 #include "CCntComboExControl.h"

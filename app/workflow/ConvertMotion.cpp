@@ -1,4 +1,4 @@
-// From the open source and the profile to the target's motion.
+// Converts the open source with the selected profile.
 
 #include "AlignMotion.h"
 #include "CContentWindow.h"
@@ -27,15 +27,15 @@ int CGaitConvertContent::ConvertMotion()
     return 1;
 }
 
-// The stamp is taken first: a change during the reading makes the next conversion read again.
+// The stamp is taken first, so that a change during reading makes the next conversion read again.
 void CGaitConvertContent::LoadResult()
 {
     const std::optional<FileStamp> stamp = StampOf(BaseFile());
     resultStamp_ = m_kResultMotion.Load(BaseFile()) ? stamp : std::nullopt;
 }
 
-// Every conversion starts with the skeleton as its file has it now. The first one after an open need not read
-// the file again, unless it has changed since.
+// Every conversion starts with the skeleton as its file has it now. The first one after an open reuses the
+// skeleton that was read at open, unless the file has changed since.
 void CGaitConvertContent::ReloadResult()
 {
     if (!resultStamp_ || resultStamp_ != StampOf(BaseFile()))
@@ -43,8 +43,8 @@ void CGaitConvertContent::ReloadResult()
     Report(BaseFile(), m_kResultMotion.Record());
 }
 
-// Converts by the profile. False, with the reason told, where it cannot drive a conversion. The source is
-// looked up behind the profile's message boxes, which may let another one in.
+// Converts with the profile. If it cannot drive a conversion, reports why and returns false. The source is
+// looked up after the profile's message boxes, during which another one may be opened.
 bool CGaitConvertContent::Retarget(bool heedsShift)
 {
     CRetargeter& retargeter = m_kRetargeter.emplace();

@@ -8,25 +8,26 @@
 
 namespace gw {
 
-/// A conversion that needs no answers on its way. Paths are UTF-8.
+/// A conversion without questions. Paths are UTF-8.
 struct MotionFileJob
 {
-    std::string source;        ///< a motion file, or a container with keys
-    std::string profile;       ///< path of a .prf file
-    std::string output;        ///< ends in .Kinetra for a package; anything else gives an .htr. Replaced
-    std::string dataFolder;    ///< of base.htr and KsBone.bsm; empty for the program's own
-    ConversionChoices choices; ///< beside the rules
+    std::string source;  ///< a motion file, or a container with keys
+    std::string profile; ///< path of a .prf file
+    /// ends in .Kinetra for a package; anything else yields an .htr. Replaced if it exists
+    std::string output;
+    std::string dataFolder;    ///< with base.htr and KsBone.bsm; empty for the program's own
+    ConversionChoices choices; ///< conversion options
 };
 
-/// What came of it.
+/// The result of such a conversion.
 struct MotionFileResult
 {
     bool written = false;
-    std::vector<CReport> reports; ///< warnings, and where nothing was written at least one that is none
+    std::vector<CReport> reports; ///< warnings and, if nothing was written, at least one failure
 };
 
-/// Opens, converts and saves one motion as window and shell do: for programs that link the engine. Leaves no
-/// settings and no folders behind.
+/// Opens, converts and saves one motion like the window and the shell, for programs that link the engine.
+/// Leaves no settings or folders behind.
 MotionFileResult ConvertMotionFile(const MotionFileJob& job);
 
 } // namespace gw

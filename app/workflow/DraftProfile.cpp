@@ -1,4 +1,4 @@
-// A profile drafted for the open source, and what is wrong with a file that reads badly.
+// Drafts a profile for the open source, and reports the faults of a file that cannot be read well.
 
 #include "CBoneMapProfile.h"
 #include "CContentWindow.h"
@@ -23,7 +23,7 @@ namespace gw {
 
 namespace {
 
-constexpr uint64_t kExamBytesLimit = uint64_t{64} << 20; // more would keep a person waiting
+constexpr uint64_t kExamBytesLimit = uint64_t{64} << 20; // a person would have to wait for more
 
 CReport Note(const std::string& path, const char* code, std::string words)
 {
@@ -35,7 +35,7 @@ CReport Note(const std::string& path, const char* code, std::string words)
     return report;
 }
 
-// The rows that a person should look at, or empty.
+// Returns the rows that a person should check, or empty.
 std::string UnsureRows(const SuggestedProfile& draft)
 {
     std::string names;
@@ -56,7 +56,7 @@ bool IsShort(const std::string& path)
 
 } // namespace
 
-// A name that no profile has yet, since one of the same name could not be reached.
+// Returns an unused name, because a second profile with the same name could not be selected.
 std::string CGaitConvertContent::DraftName() const
 {
     const std::string name = SuggestedName(SplitPath(m_kSourcePath).stem);
@@ -107,7 +107,7 @@ void CGaitConvertContent::OpenDraft(const std::string& name)
     UpdateControls();
 }
 
-// What a reader trips over is told in full where a person can unfold it.
+// All faults that a reader ran into are reported if a person can unfold them.
 void CGaitConvertContent::ReportFindings(const std::string& path)
 {
     if (!window_.ShowsFindings() || !HasExtension(path, ".bvh") || !IsShort(path))

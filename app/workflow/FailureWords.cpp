@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// The message consists of the words, the name concerned in quotes, and the remedy.
+// A message consists of the sentence, the name concerned in quotes, and the remedy.
 template <class Reason>
 struct Words
 {

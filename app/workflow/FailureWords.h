@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// Why a motion cannot be converted although it could be read, or not well.
+/// Why a motion that could be read cannot be converted, or not well.
 enum class EMisfit : uint8_t
 {
     NoScene,      ///< no source is open, or base.htr could not be read
@@ -18,21 +18,22 @@ enum class EMisfit : uint8_t
     NoRootRow,    ///< no row drives the target's root bone
     NoRootSource, ///< the row of the target's root bone is fixed
     NoFrames,     ///< the source has no frames
-    NoBody,       ///< the rows drive too little of a body to align it by
-    TurnedAtRest, ///< rows turn limbs when the source stands at rest; `name` is one of its joints
+    NoBody,       ///< the rows drive too little of a body to align it
+    TurnedAtRest, ///< rows rotate limbs in the source's rest pose; `name` is one of its joints
 };
 
-/// The short fixed word for a reason.
+/// Returns the short fixed word for a reason.
 std::string_view FailureCode(EFailure reason);
 
-/// What can be done about it; empty where nothing is known.
+/// Returns what can be done about it; empty if unknown.
 std::string_view FailureRemedy(EFailure reason);
 
-/// A failure or warning of a file, in words: "walk.bvh:12: an empty line ...". Names are made safe to print.
+/// Returns a failure or warning of a file as a report: "walk.bvh:12: an empty line ...". Names are made safe
+/// to print.
 CReport MakeReport(const std::string& path, const CFailure& failure, bool warning);
 CReport MakeReport(const std::string& path, EMisfit misfit, const std::string& name = {});
 
-/// The report as one line: path, place and words.
+/// Returns the report as one line: path, place and message.
 std::string ReportLine(const CReport& report);
 
 } // namespace gw

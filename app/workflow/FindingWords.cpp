@@ -27,7 +27,7 @@ std::string FaultSentence(const Finding& finding)
     return words;
 }
 
-// A number as people write it: "29.97", "30".
+// Returns a number as people write it: "29.97", "30".
 std::string Short(double number)
 {
     char text[32];

@@ -19,7 +19,7 @@ bool HasEmptyName(std::string_view text)
     return std::ranges::adjacent_find(text, bothSeparate) != text.end();
 }
 
-// From a root on, or from a drive.
+// Returns whether a path starts at a root or a drive.
 bool IsAbsolute(std::string_view text)
 {
     return IsSeparator(text[0]) || (text.size() > 1 && text[1] == ':');

@@ -1,4 +1,4 @@
-// Where things lie: the program's own files, the users' profiles, the host product and its help.
+// The locations of the program's own files, the users' profiles, the host product and its help.
 
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
@@ -14,7 +14,7 @@ namespace {
 
 constexpr const char* kHelpLibrary = "Kbel.dll";
 constexpr uint32_t kHelpFileString = 32824;
-constexpr size_t kHelpNameLimit = 260; // characters
+constexpr size_t kHelpNameLimit = 260; // in characters
 
 } // namespace
 

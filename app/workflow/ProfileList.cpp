@@ -1,4 +1,4 @@
-// The list of profiles: what stands in it, and what choosing an entry does.
+// The list of profiles: its contents, and the effect of selecting an entry.
 
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
@@ -23,7 +23,7 @@ constexpr int kCustom = 0; // user data of an entry
 constexpr int kStock = 1;
 constexpr int kSelectionChanged = 9; // notification of the list
 
-// The profile of a display name in a folder, or empty.
+// Returns the profile with a display name in a folder, or empty.
 std::string FindInFolder(const std::string& folder, const std::string& name)
 {
     for (const std::string& file : FilesInFolder(folder, kProfileExtension))
@@ -34,7 +34,7 @@ std::string FindInFolder(const std::string& folder, const std::string& name)
     return {};
 }
 
-// The first entry of a name, or -1.
+// Returns the first entry with a name, or -1.
 int FindItem(const CCntComboExControl& list, const std::string& name)
 {
     for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
@@ -84,7 +84,7 @@ bool CGaitConvertContent::IsListed(const std::string& name) const
                                [&](const std::string& listed) { return EqualNoCase(listed, name); });
 }
 
-// The index moves on after a deletion as well, so that the entry that slid into the place is passed over.
+// The index advances after a deletion too, so the entry that moved into its place is skipped.
 void CGaitConvertContent::PruneProfileList()
 {
     CCntComboExControl& list = *m_pkProfileCombo;
@@ -95,7 +95,7 @@ void CGaitConvertContent::PruneProfileList()
     }
 }
 
-// Loading refills the list, which is why every text is copied and looked up anew.
+// Loading refills the list, so every text is copied and looked up again.
 void CGaitConvertContent::SelectProfileByName(const std::string& name)
 {
     CCntComboExControl& list = *m_pkProfileCombo;
@@ -126,8 +126,8 @@ void CGaitConvertContent::ChooseProfile()
     CCntComboExControl& list = *m_pkProfileCombo;
     const int chosen = list.GetCurSel();
     PruneProfileList();
-    // The index of before the pruning: an entry that went before the chosen one makes this the next one's
-    // text.
+    // The index is from before the pruning: if an entry before the selected one was removed, this is the next
+    // entry's text.
     const std::string* const text = list.GetItemText(chosen);
     UseProfileFile(text ? FindProfilePath(*text) : std::string());
     UpdateControls();
@@ -151,14 +151,14 @@ void CGaitConvertContent::PickStockProfile()
     }
     if (!ProfileFits(ExeFile(kMaxFile)))
         return;
-    // A user's choice outlives an open, unless it is the other stock profile.
+    // A user's choice survives an open, unless it is the other stock profile.
     const CCntComboExControl& list = *m_pkProfileCombo;
     const std::string* const selected = list.GetItemText(list.GetCurSel());
     if (!selected || EqualNoCase(*selected, m_kPoserProfileName))
         SelectProfileByName(m_kMaxProfileName);
 }
 
-// The profile path goes on naming the deleted file until the next selection.
+// The profile path still names the deleted file until the next selection.
 void CGaitConvertContent::DeleteSelectedProfile()
 {
     CCntComboExControl& list = *m_pkProfileCombo;

@@ -1,4 +1,4 @@
-// The sources that were opened last.
+// The list of recently opened sources.
 
 #include "CGaitConvertContent.h"
 #include "Text.h"

@@ -1,4 +1,4 @@
-// From the target's motion to a file: a Kinetra package around an HTR, or the HTR alone.
+// Writes the target's motion to a file: a Kinetra package around an HTR, or the HTR alone.
 
 #include "ResultFile.h"
 
@@ -15,10 +15,10 @@ namespace {
 
 constexpr std::string_view kPackageExtension = ".Kinetra";
 constexpr std::string_view kMotionExtension = ".htr";
-// The host plays packages at this rate: a result is stored in half-steps of it.
+// The host plays packages at this rate; a result is stored in half-steps of it.
 constexpr float kHostRate = 60.0f;
 
-// Saves the result with as many times more frames as a rate stands above the profile's.
+// Saves the result with rate / profileRate times as many frames.
 bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
                 const std::function<bool(float frameScale)>& save, CFailureRecord& record)
 {
@@ -29,7 +29,7 @@ bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
     return saved || record.Fail(failure.reason, failure.where, failure.name);
 }
 
-// The motion's text goes straight into the package, so that an HTR beside the chosen name stays as it is.
+// The motion's text goes directly into the package, so an HTR file next to it is not touched.
 bool WritePackage(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
 {
     CPackageFile package;

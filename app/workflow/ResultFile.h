@@ -10,41 +10,41 @@ namespace gw {
 
 class CMotionFile;
 
-/// Frames per second of a result that a user saves, in terms of the profile's rate.
+/// Frames per second of a result saved by a user, relative to the profile's rate.
 inline constexpr float kSavedRate = 120.0f;
-/// And of one in a batch run: at a profile rate of 30 the frames stay as many as they are.
+/// Same for a batch run: at a profile rate of 30, the number of frames does not change.
 inline constexpr float kBatchRate = 30.0f;
 
-/// What a batch run makes of the files of a folder.
+/// What a batch run does with the files of a folder.
 enum class EBatchJob : uint8_t
 {
-    ToMotion,    ///< of every source (.bvh) an .htr
-    ToContainer, ///< of every .htr an .orn
+    ToMotion,    ///< converts every source (.bvh) to an .htr
+    ToContainer, ///< packages every .htr as an .orn
 };
 
-/// How a batch run goes on after a file.
+/// How a batch run continues after a file.
 enum class EBatchStep : uint8_t
 {
     Done,
     Ended,     ///< the run ends with its summary
-    Abandoned, ///< the run ends at once and leaves its title
+    Abandoned, ///< the run ends immediately and leaves its title
 };
 
-/// The extension of the files that a batch run takes, and that of its results.
+/// Returns the extension of the files that a batch run reads, and that of its results.
 std::string_view BatchSource(EBatchJob job);
 std::string_view BatchResult(EBatchJob job);
 
-// Each of these replaces what is there, and answers false with the reason recorded where nothing was written.
+// Each of these replaces an existing file. If nothing was written, it records the reason and returns false.
 
-/// Writes a result as a user saves it: a package where the path ends in .Kinetra, else an .htr of that name.
+/// Writes a result saved by a user: a package if the path ends in .Kinetra, otherwise an .htr with that name.
 bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record);
-/// Writes a result as HTR with as many times more frames as a rate stands above the profile's.
+/// Writes a result as HTR with rate / profileRate times as many frames.
 bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, int profileRate,
                      CFailureRecord& record);
-/// Packages an HTR file as a batch run does.
+/// Packages an HTR file like a batch run.
 bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record);
 
-/// The path with another extension, which begins with a dot.
+/// Returns the path with another extension, which starts with a dot.
 std::string WithExtension(const std::string& path, std::string_view extension);
 
 } // namespace gw

@@ -1,4 +1,4 @@
-// Asks for a file, saves the result there, and tells of it.
+// Asks for a file, saves the result there, and reports it.
 
 #include "CBoneMapProfile.h"
 #include "CContentWindow.h"
@@ -12,7 +12,7 @@ namespace gw {
 
 namespace {
 
-constexpr const char* kNotSaved = "not saved: "; // begins the title after a failed save
+constexpr const char* kNotSaved = "not saved: "; // prefix of the title after a failed save
 
 } // namespace
 
@@ -23,7 +23,7 @@ int CGaitConvertContent::SaveResult()
         return 1;
     const CWaitCursor wait(window_);
     WriteResult(*path);
-    m_bSaved = true; // even if it was not: the title and the box report that
+    m_bSaved = true; // set even if saving failed: title and message box report that
     std::string title;
     std::string text = Message(kShowFileMessage);
     if (m_kWriteRecord.Failure())
@@ -38,7 +38,7 @@ int CGaitConvertContent::SaveResult()
     return 1;
 }
 
-// The next step ends what the title reports of the last save.
+// The next step clears the title's report about the last save.
 void CGaitConvertContent::ForgetFailedSave()
 {
     if (m_kTitle.starts_with(kNotSaved))

@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// The capital F is right: this is the name of an object and not of the class.
+// The capital F is correct: this is the name of an object, not of the class.
 constexpr const char* kTrackName = "CKeyFrameControl";
 
 CKeyframeControl* FirstTrack(CNode* root, const char* name, const CRTTI* record)
@@ -36,7 +36,7 @@ SourceTiming TimingOf(const CKeyframeControl* track)
     return track ? SourceTiming{track->m_fEndTime, track->m_fFrequency} : SourceTiming();
 }
 
-// Reads beside the scene that is there, since a damaged file must leave it as it is.
+// Reads into a separate scene, because a damaged file must not change the current one.
 bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record)
 {
     COrrinStream stream;
@@ -71,7 +71,7 @@ CKeyframeControl* ConversionTrack(CNode* root)
 int SourceRateOf(CNode* root)
 {
     constexpr double kUsual = 30.0;
-    constexpr double kBeyond = 1e9; // fits an int
+    constexpr double kBeyond = 1e9; // fits into an int
     const CKeyframeControl* track = ConversionTrack(root);
     const double rate = track && track->m_fFrequency > 0.0f ? 1.0 / track->m_fFrequency : kUsual;
     return static_cast<int>(std::lround(std::min(rate, kBeyond)));

@@ -16,7 +16,7 @@
 #endif
 
 #ifdef GW_COUNTS_MEMORY
-// The sanitizer's own functions. Their header comes with one of the two compilers only.
+// The sanitizer's functions. Only one of the two compilers provides their header.
 extern "C" int __sanitizer_install_malloc_and_free_hooks(void (*onAllocated)(const volatile void*, size_t),
                                                          void (*onFreed)(const volatile void*));
 extern "C" size_t __sanitizer_get_allocated_size(const volatile void* block);
@@ -30,8 +30,7 @@ constexpr size_t kFixedBytes = size_t{64} << 20;
 constexpr size_t kBytesPerInputByte = 16;
 constexpr int64_t kUnlimited = std::numeric_limits<int64_t>::max();
 
-// The sanitizer's hooks take no context, so that these are the process's. Below 0 where older memory is
-// freed.
+// The sanitizer's hooks have no context, so these are global. Negative when older memory is freed.
 std::atomic<int64_t> g_iTaken = 0;
 std::atomic<int64_t> g_iLimit = kUnlimited;
 
@@ -41,13 +40,13 @@ std::atomic<int64_t> g_iLimit = kUnlimited;
 
 namespace {
 
-// Called inside of malloc: nothing in here may allocate.
+// Called inside malloc: must not allocate.
 void OnAllocated(const volatile void*, size_t byteCount)
 {
     if (g_iTaken.fetch_add(static_cast<int64_t>(byteCount)) + static_cast<int64_t>(byteCount) <= g_iLimit)
         return;
     constexpr char kWords[] = "broken: 64 MiB and 16 times the input are memory enough\n";
-    g_iLimit = kUnlimited; // what tells of it takes memory too
+    g_iLimit = kUnlimited; // reporting it allocates too
     [[maybe_unused]] const ssize_t written = write(STDERR_FILENO, kWords, sizeof kWords - 1);
     std::abort();
 }

@@ -4,9 +4,9 @@
 
 namespace gw {
 
-/// What an input may take of memory while it is worked on: 64 MiB and 16 times its size, beside what was
-/// there before. Whoever takes more ends the program at that very allocation. Only programs with
-/// AddressSanitizer can look; in others it counts nothing.
+/// Limits the memory that an input may use while it is processed: 64 MiB plus 16 times its size, in addition
+/// to what was allocated before. An allocation beyond that ends the program. Works only with
+/// AddressSanitizer; in other builds, counts nothing.
 class CMemoryBudget
 {
 public:

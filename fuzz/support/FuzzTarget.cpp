@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// A folder of its own for each program, so that several may run at once.
+// A separate folder per process, so that several can run at the same time.
 class CScratchFolder
 {
 public:

@@ -7,18 +7,17 @@
 
 namespace gw {
 
-/// What a target does with one input: reads it, and where it can be read, holds it against the promises. Each
-/// target defines this once.
+/// Processes one input: reads it and, if that succeeds, checks the promises. Each target defines this once.
 void FuzzOne(std::span<const std::byte> input);
 
-/// Ends the program unless a promise holds, as a crash that whoever runs it keeps the input of.
+/// Ends the program if a promise does not hold. The fuzzer treats that as a crash and keeps the input.
 void Require(bool holds, const char* promise);
 
-/// The text of an input.
+/// Returns the text of an input.
 std::string_view TextOf(std::span<const std::byte> input);
-/// A path in the folder of this run, which goes with the program.
+/// Returns a path in the folder of this run, which is deleted at the end.
 std::string ScratchPath(std::string_view name);
-/// Replaces a file in that folder and answers its path.
+/// Writes a file in that folder and returns its path.
 std::string ScratchFile(std::string_view name, std::span<const std::byte> bytes);
 
 } // namespace gw

@@ -11,8 +11,8 @@ namespace {
 
 using Row = std::vector<PixelRGBA>;
 
-// Beyond it only the first and the last rows are looked at: a BMP file has a row size of a gigabyte for the
-// asking, but its rows take the time that they take.
+// In larger pictures, only the first and last rows are read: a BMP file can claim rows of a gigabyte, and
+// reading them all takes too long.
 constexpr int64_t kMostPixels = 1 << 20;
 
 Row RowOf(CPicture& picture, int y)
@@ -60,7 +60,7 @@ void RequireSameCopy(CPicture& picture, const std::string& path)
     const PictureBox box = picture.Box();
     const auto copy = OpenPicture(path, "w");
     Require(copy && copy->SetChannelCount(3) && copy->SetSize(box), "a copy can be begun");
-    // Written from the top on.
+    // Written from the top.
     const auto rowFromTop = [&](int y) { return picture.IsBottomFirst() ? box.height - 1 - y : y; };
     for (int y = 0; y < box.height; ++y)
         Require(copy->WriteRowRGBA(y, 0, box.width, RowOf(picture, rowFromTop(y)).data()),

@@ -6,9 +6,9 @@
 
 namespace gw {
 
-/// Reads every row of a picture in both forms, as far as it can be read. False where a row cannot.
+/// Reads every row of a picture in both forms, as far as possible. Returns false if a row cannot be read.
 bool ReadsWhole(CPicture& picture);
-/// Requires that a copy of a picture can be written and has the same colours.
+/// Requires that a copy of a picture can be written and has the same colors.
 void RequireSameCopy(CPicture& picture, const std::string& path);
 
 } // namespace gw

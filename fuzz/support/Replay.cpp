@@ -1,5 +1,4 @@
-// Runs a target over files and folders of files, in a build that has no fuzzer. It only ends well where every
-// input does.
+// Runs a target on files and folders of files, in builds without a fuzzer. Succeeds only if every input does.
 
 #include <algorithm>
 #include <cstdint>
@@ -44,5 +43,5 @@ int main(int argc, char** argv)
 {
     const std::vector<fs::path> paths = InputsOf(argc, argv);
     std::ranges::for_each(paths, Replay);
-    return paths.empty() ? 1 : 0; // a replay of nothing proves nothing
+    return paths.empty() ? 1 : 0; // replaying nothing must not count as success
 }

@@ -1,4 +1,4 @@
-// Every row of a BMP file in both forms, and a copy that has the same pixels.
+// Reads every row of a BMP file in both forms, and writes a copy that must have the same pixels.
 
 #include "FuzzTarget.h"
 #include "PicturePromises.h"

@@ -1,4 +1,4 @@
-// A motion that could be read is written as one of its own kind and read again.
+// Writes a motion that was read in its own format, and reads it again.
 
 #include "FuzzTarget.h"
 #include "MotionPromises.h"

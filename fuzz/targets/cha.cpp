@@ -1,4 +1,4 @@
-// A motion of matrices, as text.
+// Reads a motion of matrices in text form.
 
 #include "FuzzTarget.h"
 #include "MotionPromises.h"

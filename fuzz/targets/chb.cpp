@@ -1,4 +1,4 @@
-// A motion of matrices, in binary.
+// Reads a motion of matrices in binary form.
 
 #include "FuzzTarget.h"
 #include "MotionPromises.h"

@@ -1,5 +1,5 @@
-// Scene containers with every class. What could be read is posed and cloned, and its bytes survive being
-// written and read again.
+// Reads scene containers with every class. What was read is posed and cloned, and its bytes must survive
+// being written and read again.
 
 #include "COrrinStream.h"
 #include "CSpatial.h"

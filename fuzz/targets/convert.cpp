@@ -1,4 +1,4 @@
-// The command as its users run it: any file becomes a result, or a clear failure and no file.
+// Runs the command as users do: any file must produce a result, or a clear failure and no file.
 
 #include "CommandTable.h"
 #include "FuzzTarget.h"
@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-// The first byte of an input is no part of the file: it says how it is converted.
+// The first byte of an input is not part of the file; it selects the conversion options.
 enum EWay : uint8_t
 {
     kContainer = 1,

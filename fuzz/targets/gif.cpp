@@ -1,4 +1,4 @@
-// Every image of a GIF file, up to the first that is damaged.
+// Reads every image of a GIF file, up to the first damaged one.
 
 #include "FuzzTarget.h"
 #include "PicturePromises.h"

@@ -1,4 +1,4 @@
-// A motion with its rest pose, written as one of its own kind and read again.
+// Writes a motion with its rest pose in its own format, and reads it again.
 
 #include "FuzzTarget.h"
 #include "MotionPromises.h"
@@ -9,7 +9,7 @@ void gw::FuzzOne(std::span<const std::byte> input)
     if (!motion.Load(ScratchFile("in.htr", input)))
         return;
     RequireSoundMotion(motion);
-    // A count of frames is taken at its word, so that a line may ask for a file of many megabytes.
+    // The frame count is used as it is, so a single line can produce a file of many megabytes.
     if (motion.GetLastFrame() > static_cast<float>(input.size()))
         return;
     Require(motion.Save(ScratchPath("out.htr"), 1.0f), "what was read can be written");

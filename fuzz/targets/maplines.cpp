@@ -1,4 +1,4 @@
-// The older map syntax: whatever a line is, its text stays as it stands, up to a return at its end.
+// The older map syntax: the text of a line must not change, except for a carriage return at its end.
 
 #include "MapLines.h"
 #include "CMapLineList.h"
@@ -31,7 +31,7 @@ void FuzzOne(std::span<const std::byte> input)
         return Require(input.size() > kProfileByteLimit, "every text is a map");
     const std::string out = ScratchPath("out.map");
     Require(WriteMapLines(out, lines), "what was read can be written");
-    if (!ReadMapLines(out, again)) // line ends may have brought it over the limit
+    if (!ReadMapLines(out, again)) // line ends may have pushed it over the limit
         return;
     Require(std::ranges::equal(lines, again, SayTheSame), "lines survive a save");
 

@@ -1,4 +1,5 @@
-// The plan of a run: what can be read is written and read again, and its options are taken or refused.
+// The plan of a run: plans that were read must survive being written and read again, and their options are
+// accepted or refused.
 
 #include "CRunPlan.h"
 #include "FuzzTarget.h"
@@ -15,8 +16,7 @@ bool IsSameEntry(const CRunPlan::Entry& a, const CRunPlan::Entry& b)
     return a.source == b.source && a.output == b.output && a.byteCount == b.byteCount && a.shard == b.shard;
 }
 
-// Options that were understood are understood again, from fewer words: a value that is the default is left
-// out.
+// Options that were accepted must be accepted again in their shorter form, without values that are defaults.
 void CheckOptions(const std::string& text)
 {
     ShellOptions first, second;

@@ -1,4 +1,4 @@
-// A bone map: its rows measured against a skeleton, and written and read again.
+// A bone map: its rows are matched with a skeleton, and written and read again.
 
 #include "CMapRowTable.h"
 #include "CNode.h"
@@ -10,8 +10,8 @@ namespace gw {
 
 namespace {
 
-// What a profile says, as the editor takes it. `isWhole` where each row has both its names, so that it can be
-// told apart again.
+// The contents of a profile as the editor reads it. `isWhole` is true if each row has both names, so that it
+// can be parsed again.
 struct ReadRows
 {
     explicit ReadRows(std::string_view text)
@@ -44,8 +44,8 @@ struct ReadRows
     bool isWhole = true;
 };
 
-// An axis that is none stands for the neutral one, so that texts may differ where numbers do not; and a row
-// without a source has no use for a rotation.
+// An invalid axis equals the neutral one, so texts may differ while numbers do not. A row without a source
+// ignores its rotation.
 bool IsSameRow(const CMapRowTable& a, const CMapRowTable& b, int row)
 {
     const RowNumbers one = a.Numbers(row);

@@ -1,4 +1,4 @@
-// Lines of a run's report: the failures and warnings of each survive being written and read again.
+// Lines of a run's report: failures and warnings must survive being written and read again.
 
 #include "CJsonWriter.h"
 #include "CReport.h"

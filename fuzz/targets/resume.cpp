@@ -1,4 +1,4 @@
-// The state of earlier runs: whatever a file holds, a run adds to it and finds what it added.
+// The state of earlier runs: whatever a file contains, a run can add to it and find what it added.
 
 #include "CResumeState.h"
 #include "FuzzTarget.h"
@@ -20,7 +20,7 @@ void FuzzOne(std::span<const std::byte> input)
     next.Read(folder);
     Require(next.Knows("begun") && next.Knows("made"), "an output is known again");
     Require(next.FindTold("made", "a key", "digits") != nullptr, "what was made is found");
-    // A name that the input itself holds: each line is looked for as a name, too.
+    // Names from the input: each line is also looked up as a name.
     std::string_view rest = TextOf(input);
     for (std::string_view line; NextLine(rest, line);)
         Require(!first.Knows(std::string(line)) || next.Knows(std::string(line)), "nothing is forgotten");

@@ -1,4 +1,4 @@
-// The settings file: every value that is stored is found again, whatever stands there already.
+// The settings file: every stored value must be found again, whatever the file contains.
 
 #include "FuzzTarget.h"
 #include "IniText.h"
@@ -11,7 +11,7 @@ void gw::FuzzOne(std::span<const std::byte> input)
     const std::string value = "a, \"b\"; c=d\\";
     const std::string written = SetIniValue(text, "Settings", "LastFolder", value);
     Require(FindIniValue(written, "Settings", "LastFolder") == value, "what was stored is found");
-    // Of several byte order marks each save takes one.
+    // Each save removes one of several byte order marks.
     Require(SetIniValue(written, "Settings", "LastFolder", value) == SkipByteOrderMark(written),
             "storing again changes nothing");
 }

@@ -1,4 +1,4 @@
-// The share file, read for a skeleton that has some of the bones.
+// Reads the share file for a skeleton that has some of the bones.
 
 #include "CRetargeter.h"
 #include "FuzzTarget.h"

@@ -1,4 +1,4 @@
-// The string table of a library, and what a translated text does as a format.
+// The string table of a library, and a translated text used as a format.
 
 #include "CStringLibrary.h"
 #include "FuzzTarget.h"

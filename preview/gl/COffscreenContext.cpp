@@ -12,8 +12,8 @@ namespace gw {
 
 namespace {
 
-// The display of no screen, or null. It belongs to the process: other contexts may use it when one ends, so
-// it is never terminated.
+// Returns a display without a screen, or null. It is shared by the whole process: other contexts may still
+// use it when one ends, so it is never terminated.
 EGLDisplay OpenDisplay()
 {
     EGLDisplay display = eglGetPlatformDisplay(EGL_PLATFORM_SURFACELESS_MESA, nullptr, nullptr);
@@ -64,7 +64,7 @@ RgbPicture COffscreenContext::ReadPixels(int width, int height) const
     RgbPicture picture(width, height);
     glPixelStorei(GL_PACK_ALIGNMENT, 1);
     glReadPixels(0, 0, width, height, GL_RGB, GL_UNSIGNED_BYTE, picture.rgb.data());
-    // GL's first row is the lowest.
+    // GL's first row is the bottom one.
     for (int top = 0, bottom = height - 1; top < bottom; ++top, --bottom)
         std::swap_ranges(picture.Pixel(0, top), picture.Pixel(0, top + 1), picture.Pixel(0, bottom));
     return picture;

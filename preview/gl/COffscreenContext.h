@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A GL context with a surface of its own and no display: what is drawn can be read back. It is current in
-/// the thread that created it, until its end; the thread must have no other one current.
+/// A GL context with its own surface and no display, whose pixels can be read back. It is current in the
+/// thread that created it until it is destroyed; that thread must not have another current context.
 class COffscreenContext
 {
 public:
@@ -14,13 +14,13 @@ public:
     COffscreenContext(const COffscreenContext&) = delete;
     COffscreenContext& operator=(const COffscreenContext&) = delete;
 
-    /// Once. False where the machine's GL has no such contexts, or none of that many pixels.
+    /// Call once. Returns false if the machine's GL has no such contexts, or none with that many pixels.
     bool Create(int width, int height);
-    /// The lower left part of the surface; a size within that of Create.
+    /// Returns the lower left part of the surface, within the size passed to Create.
     RgbPicture ReadPixels(int width, int height) const;
 
 private:
-    // The handles of EGL are pointers; its headers stay out of this one.
+    // EGL handles are pointers; its headers are not included here.
     void* m_pkDisplay = nullptr;
     void* m_pkSurface = nullptr;
     void* m_pkContext = nullptr;

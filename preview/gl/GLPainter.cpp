@@ -20,7 +20,7 @@ void LookThrough(const GLScene& scene)
     gluLookAt(eye.x, eye.y, eye.z, at.x, at.y, at.z, up.x, up.y, up.z);
 }
 
-// The whole list by one call. A call for each triangle gives the same pixels and takes a third longer.
+// Draws the whole list with one call. One call per triangle draws the same pixels but takes a third longer.
 void DrawLines(std::span<const LineEnd> ends)
 {
     if (ends.empty())

@@ -4,8 +4,8 @@ namespace gw {
 
 struct GLScene;
 
-/// What a view asks of its surface, in bits, beside two colour buffers: no alpha, stencil, accumulation or
-/// samples.
+/// The surface that a view needs, in bits, in addition to two color buffers: no alpha, stencil, accumulation
+/// or samples.
 struct PixelFormat
 {
     int redBits = 8;
@@ -15,13 +15,13 @@ struct PixelFormat
 };
 inline constexpr PixelFormat kPixelFormat;
 
-// Each call wants a current context: version 2.1 or a compatibility profile, with no buffer object bound.
+// Each function needs a current context: version 2.1 or a compatibility profile, with no buffer object bound.
 
-/// Once for each context: flat shading and the clear colour.
+/// Call once per context. Sets flat shading and the clear color.
 void InitGL();
-/// Viewport and projection for a surface of that many pixels. Below 1 both stay as they were.
+/// Sets viewport and projection for a surface size. Sizes below 1 are ignored.
 void ResizeGL(int width, int height);
-/// Clears and draws a scene, and waits until that is done. Swapping buffers is the window's.
+/// Clears, draws a scene, and waits until it is done. The window swaps the buffers.
 void PaintGL(const GLScene& scene);
 
 } // namespace gw

@@ -4,8 +4,7 @@ namespace gw {
 
 class CPicturePainter;
 
-/// The painter of this machine, loaded at the first call; null where its module, or a library that it needs,
-/// is not there.
+/// Returns the painter, loaded at the first call; null if its module, or a library that it needs, is missing.
 CPicturePainter* LoadPicturePainter();
 
 } // namespace gw

@@ -1,3 +1,6 @@
+// Draws poses side by side into one picture. All poses of a motion are measured first, so that they share one
+// scale; then each is drawn into its own cell.
+
 #include "RenderPicture.h"
 
 #include "Angles.h"
@@ -23,7 +26,7 @@ struct Cell
     int height;
 };
 
-// The picture cut into equal views; where pixels remain, some are one pixel larger.
+// The picture divided into equal views; the first ones get the remaining pixels.
 struct Grid
 {
     int width;
@@ -39,7 +42,7 @@ struct Grid
     }
 };
 
-// The place of a pose in all motions: a frame of the first one, of as many as it has.
+// A moment in all motions: a frame of the first one, relative to its frame count.
 struct Moment
 {
     int frame;
@@ -78,7 +81,7 @@ void Paste(const RgbPicture& part, const Cell& cell, RgbPicture& picture)
         std::copy_n(part.Pixel(0, y), part.RowBytes(), picture.Pixel(cell.left, cell.top + y));
 }
 
-// The middle of the lines' axis-aligned box and half of its sides; zero for no lines.
+// Center and half size of the lines' axis-aligned box; zero without lines.
 struct Extent
 {
     Vec3 centre = kVec3Zero;
@@ -100,7 +103,7 @@ Extent ExtentOf(std::span<const LineEnd> ends)
     return {(low + high) * 0.5f, (high - low) * 0.5f};
 }
 
-// Draws the poses of one motion after another.
+// Draws the poses of one motion.
 class CPoseDrawer
 {
 public:
@@ -110,7 +113,7 @@ public:
         m_kView.SetHighlight(highlight);
     }
 
-    // Finds the box that holds every pose.
+    // Computes the box that contains every pose.
     void Measure(const std::vector<Moment>& moments)
     {
         for (const Moment& moment : moments)
@@ -139,7 +142,8 @@ private:
             m_kView.SeekStart();
     }
 
-    // From where the near side of the box fits into the cell. A bounding sphere would take twice the room.
+    // Returns the distance at which the near side of the box fits into the cell. A bounding sphere would take
+    // twice the space.
     float EyeDistance(const Cell& cell) const
     {
         const float heightToWidth = static_cast<float>(cell.height) / static_cast<float>(cell.width);
@@ -178,7 +182,7 @@ int FirstFrame(const PictureOptions& options)
 
 bool IsDrawable(const PictureOptions& options)
 {
-    // Each part of a side needs a pixel.
+    // Each part of a side needs at least one pixel.
     const auto holds = [](int side, int parts) { return side <= kLongestSide && parts <= side; };
     if (options.motions.empty() || options.motions.size() > kLongestSide || options.poseCount < 1)
         return false;

@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// Writes a picture or replaces one, in one step. False for a picture without pixels and for a file that
-/// cannot be written; an old file stands then.
+/// Writes a picture atomically, replacing an old one. Returns false, keeping an old file, if the picture has
+/// no pixels or the file cannot be written.
 bool WritePng(const std::string& path, const RgbPicture& picture);
 
 } // namespace gw

@@ -1,3 +1,12 @@
+// Safe save. The bytes are written to a hidden file in the destination's folder, synced, and renamed over the
+// destination, so at every moment a complete file exists: the old one or the new one. The file must be in the
+// same folder because a rename is atomic only within one file system.
+//
+// A replaced file keeps its group and permissions. While the bytes are written, the hidden file is readable
+// by the user only; the permissions are set just before the rename. If nothing may be replaced
+// (KeepExisting), the rename is one that fails if the destination exists, or a hard link, or a claimed empty
+// file, in this order: each works on file systems that lack the ones before.
+
 #include "CSafeFile.h"
 
 #include "Paths.h"

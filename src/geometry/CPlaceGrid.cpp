@@ -1,3 +1,7 @@
+// Neighbor search with a uniform grid, stored as a sorted list of (cell, point) instead of a hash map. All
+// points within the distance are in the 3 x 3 x 3 cells around a point. The three cells along z follow each
+// other in the list, so nine binary searches find them all.
+
 #include "CPlaceGrid.h"
 
 #include <algorithm>

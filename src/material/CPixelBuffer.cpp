@@ -1,4 +1,4 @@
-// Pixel memory. A block is on the heap, in the temp store, or owned by somebody else; all three are accessed
+// Pixel memory. A block is on the heap, in the temp store, or owned by the caller; all three are accessed
 // between Lock and Unlock only. Sizes come from files, so every size is checked before memory is allocated,
 // and a failed operation changes nothing.
 

@@ -19,7 +19,7 @@ enum class EPixelStorage : uint16_t
 {
     Heap,
     TempStore, ///< in the process's temp store, mapped only while locked
-    Foreign,   ///< owned by somebody else; never freed or resized here
+    Foreign,   ///< owned by the caller; never freed or resized here
 };
 
 /// A raster of pixels, accessed only through CPixelLock and CPixelView. Operations do not throw; if one
@@ -37,7 +37,7 @@ public:
     /// below 1, an unknown format, too little memory, a new size for foreign pixels, and while a lock is
     /// held.
     bool Create(int32_t width, int32_t height, int32_t format, const uint8_t* fill = nullptr);
-    /// Uses somebody else's pixels, stride x height bytes, which must stay valid until this is freed or
+    /// Refers to stride x height bytes owned by the caller, which must stay valid until this is freed or
     /// destroyed.
     bool Attach(uint8_t* pixels, int32_t width, int32_t height, int32_t format);
     /// Frees the pixels; foreign ones are only forgotten. Returns false while a lock is held.

@@ -9,8 +9,8 @@
 
 namespace gw {
 
-/// Limits for the visits of a recursive walk from the roots, which meets a shared object once per path: per
-/// object, and in total, where one update takes seconds.
+/// Limits on the visits of a walk from the roots, which visits a shared object once per path to it: a limit
+/// per object, and one in total, at which an update takes seconds.
 inline constexpr double kVisitsPerObject = 1e6;
 inline constexpr double kVisitsLimit = 5e7;
 

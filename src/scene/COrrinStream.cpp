@@ -1,11 +1,11 @@
 // The container reader and writer.
 //
 // A scene is a graph: objects share children, controls point back at their targets. A file is flat: one
-// record per object, in which a reference is the id that the other object had when the file was written. Ids
-// mean nothing outside their file, and a record can refer to one that comes later. So reading takes two
-// passes. The first creates an object per record, by class name, lets it read its fields, and collects the
-// ids it read in a CLinkRecord. The second replaces the ids by references, in the same field order. An
-// unknown id becomes null, and so does an object of the wrong class; the first record with an id wins.
+// record per object, in which a reference is the id in the other object's record. Ids mean nothing outside
+// their file, and a record can refer to one that comes later. So reading takes two passes. The first creates
+// an object per record, by class name, lets it read its fields, and collects the ids it read in a
+// CLinkRecord. The second replaces the ids by references, in the same field order. An unknown id becomes
+// null, and so does an object of the wrong class; the first record with an id wins.
 //
 // Nothing in a file is trusted. Each count is checked against the bytes that are left before memory is
 // allocated, so the objects cannot take more than a fixed multiple of the file size, and reading ends because
@@ -14,8 +14,13 @@
 // a cycle, nest them deeper than the stack allows, or share them so often that a walk never ends. Such a
 // graph is unlinked object by object, because even deleting it recursively could overflow the stack.
 //
-// Writing collects every object that the roots hold, in field order, gives each the id it has in memory, and
-// writes the records in that order. Roots are marked by a name in front of their class name.
+// Writing collects every object that the roots hold, each once and in field order, numbers them from 1, and
+// writes the records in that order. Roots are marked by a name in front of their class name. The size is
+// computed first, so a scene that is too large leaves the old file alone.
+//
+// Numbers: the header is 21 bytes with its zero byte, and its first 16 are compared; the digits of the
+// version follow. Offsets are signed 32-bit, hence the limit of 2 GiB. Loading stops when half of all object
+// ids are in use; the rest is left for clones and for objects that are built outside a file.
 
 #include "COrrinStream.h"
 

@@ -49,8 +49,8 @@ inline constexpr uint64_t kContainerBytesLimit = 0x7fffffff;
 
 /// Reads and writes scene containers (.orn, .Kinetra): a flat sequence of object records that refer to each
 /// other by link ids. Reading takes two passes, build and link; so does writing, register and save. A stream
-/// keeps its roots and can be reused. The bool results follow an old convention; Record() says what really
-/// happened.
+/// keeps its roots and can be reused. The bool results are kept for compatibility; Record() contains the
+/// actual failure.
 class COrrinStream
 {
 public:

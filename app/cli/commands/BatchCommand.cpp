@@ -18,8 +18,8 @@ namespace gw {
 
 namespace {
 
-// The desktop program takes the profile that is selected. Without --profile it is the one that `convert`
-// would take for the first file.
+// The desktop program uses the selected profile. Without --profile, use the one that `convert` would choose
+// for the first file.
 bool SelectProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first)
 {
     if (options.job != "htr")
@@ -39,7 +39,7 @@ void WriteJson(const ShellOptions& options, const std::vector<CReport>& reports,
     json.EndDocument();
 }
 
-// The file that ended the run is none of those that were finished.
+// The file that ended the run does not count as finished.
 size_t FinishedCount(const ShellOptions& options, const CBatchRun& run, bool failed)
 {
     const size_t taken = run.TakenCount();
@@ -63,8 +63,8 @@ EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
     return exit == EExit::Done && failed ? EExit::Failed : exit;
 }
 
-// The folder alone and results beside their sources, as in the desktop program; with an output folder all
-// that lies below as well.
+// Only the folder itself, with results next to their sources, as in the desktop program; with an output
+// folder, its subfolders as well.
 bool ListJobs(const ShellOptions& options, CFileRun::Jobs& jobs)
 {
     const EBatchJob job = BatchJobOf(options);

@@ -20,7 +20,7 @@ namespace gw {
 
 namespace {
 
-// The result of a conversion, out of its package where it lies in one.
+// Loads the result of a conversion, unpacked if it is in a package.
 bool LoadResult(const ShellOptions& options, const std::string& path, CMotionFile& motion)
 {
     if (HasExtension(path, ".Kinetra"))
@@ -32,7 +32,7 @@ bool LoadResult(const ShellOptions& options, const std::string& path, CMotionFil
     return loaded;
 }
 
-// The source as its file has it, or as a conversion with --align reads it.
+// The source as stored in its file, or as a conversion with --align reads it.
 class CComparedSource
 {
 public:
@@ -69,7 +69,7 @@ bool CComparedSource::LoadFile()
     return true;
 }
 
-// A container moves by its first track, under its first node.
+// A container is animated by its first track, under its first node.
 MotionClip CComparedSource::Clip()
 {
     if (options_.align)

@@ -14,7 +14,7 @@ namespace gw {
 
 namespace {
 
-constexpr float kPackageSixty = 60.0f; // what every package says behind its rate
+constexpr float kPackageSixty = 60.0f; // stored after the rate in every package
 
 EExit Fail(const std::string& path, EFailure reason)
 {

@@ -16,8 +16,8 @@ namespace gw {
 
 namespace {
 
-// The file that will be written for a name: a name without an extension gets the save dialog's, and an .htr
-// is written in small letters.
+// Determines the file to write: a name without an extension gets the save dialog's, and .htr is written in
+// lowercase.
 bool ResolveOutput(std::string& output)
 {
     const PathParts parts = SplitPath(output);
@@ -50,7 +50,7 @@ bool IsOne(const ShellOptions& options)
            !FolderExists(options.files[0]);
 }
 
-// In this process: a crash costs nothing else.
+// In this process, since a crash would lose nothing else.
 EExit RunOne(const ShellOptions& options, const ConversionJob& job)
 {
     std::optional<CPagePart> part;
@@ -94,7 +94,7 @@ EExit ConvertMany(const ShellOptions& options)
         return EExit::Usage;
     if (const EExit listed = ListConversions(options, jobs); listed != EExit::Done)
         return listed;
-    if (!MakeOutputFolder(options) || !HasPageFolder(options)) // which may be the same
+    if (!MakeOutputFolder(options) || !HasPageFolder(options)) // both can be the same folder
         return EExit::Failed;
     return CConversionRun(options, jobs, StateOf(options)).RunAll();
 }

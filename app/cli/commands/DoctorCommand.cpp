@@ -1,3 +1,6 @@
+// `doctor`: examines motion files and optionally writes a repaired copy. The exit code of --fix depends on
+// the copy, because that is the file that will be used next.
+
 #include "CFileExam.h"
 #include "CJsonWriter.h"
 #include "CSceneFile.h"
@@ -36,7 +39,7 @@ void PrintLine(const std::string& line)
     std::printf("%s\n", line.c_str());
 }
 
-// Notes are among the facts.
+// Notes are listed with the facts.
 void PrintFaults(const std::string& path, const CFindings& findings)
 {
     for (const Finding& finding : findings.Sorted())
@@ -59,7 +62,7 @@ void Print(const ShellOptions& options, const std::string& path, const CFileExam
     PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()) + (mixed ? ", rotation orders: mixed" : ""));
 }
 
-// `fixed` says whether a mended copy was written.
+// `fixed`: a repaired copy was written.
 void WriteFinding(CJsonWriter& json, const std::string& path, const Finding& finding, bool fixed)
 {
     json.BreakLine();
@@ -100,7 +103,7 @@ void WriteFacts(CJsonWriter& json, const std::optional<MotionFacts>& facts)
     json.EndObject();
 }
 
-// The object of a file without its end, so that a mended copy can stand in it.
+// Writes a file's object without its end, so that a repaired copy can be added.
 void BeginJson(CJsonWriter& json, const std::string& path, const CFileExam& exam, bool fixed)
 {
     json.BeginObject();
@@ -167,7 +170,7 @@ void TellFixed(const ShellOptions& options, const CFileExam& exam, const CFileEx
     PrintFaults(options.fix, copy.Findings());
 }
 
-// Only what the copy is like counts: whoever goes on takes that.
+// Only the state of the copy counts, because that is what will be used next.
 EExit FixFile(const ShellOptions& options)
 {
     const std::string& source = options.files[0];

@@ -47,7 +47,7 @@ EExit RunDump(const ShellOptions& options)
     if (!WriteTreeView(folder))
         return Fail(folder + "TreeView.js", "the file cannot be written");
 
-    // Thousands of pages are synced together: one by one, that would take half of the time.
+    // Thousands of pages are synced together; syncing them one by one would take half of the time.
     CDeferredSync sync;
     sync.Add(folder);
     CSafeFile::DeferSyncs(true);

@@ -1,3 +1,6 @@
+// `info`: prints what a file contains. Motion files are loaded like for a conversion; containers are read
+// without decoding linked pictures, of which only the names are shown.
+
 #include "CJsonWriter.h"
 #include "CKeyframeControl.h"
 #include "CSceneFile.h"
@@ -16,7 +19,7 @@ namespace gw {
 
 namespace {
 
-// What a track says about time.
+// The timing of a track.
 struct Timing
 {
     int64_t frames = 0;
@@ -36,7 +39,7 @@ Timing TimingOf(const CKeyframeControl* track)
     return {static_cast<int64_t>(frames), track->m_fEndTime, track->m_fFrequency};
 }
 
-// A batch run writes packages as .orn, so that the name does not tell.
+// A batch run writes packages as .orn, so the extension is not enough.
 std::string FormatOf(const std::string& path, CSceneFile& file)
 {
     if (file.IsContainer())
@@ -124,7 +127,7 @@ EExit RunInfo(const ShellOptions& options)
 {
     const std::string& path = options.files[0];
     CSceneFile file;
-    file.Scene().SetPictureLimit(0); // names are all that is printed of linked pictures
+    file.Scene().SetPictureLimit(0); // only the names of linked pictures are printed
     if (!file.Load(path))
     {
         SayFailure(path, file.Failure());

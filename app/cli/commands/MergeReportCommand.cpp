@@ -1,3 +1,6 @@
+// `merge-report`: joins the reports of a plan's shards. Lines are matched to the plan by output, so the order
+// of the reports does not matter, and a source reported twice counts with its last line.
+
 #include "CMappedFile.h"
 #include "CReport.h"
 #include "CSafeFile.h"
@@ -18,7 +21,7 @@ namespace gw {
 
 namespace {
 
-/// The line of a report about an output.
+/// The last report line for an output.
 struct ReportLineOf
 {
     std::string text;
@@ -27,7 +30,7 @@ struct ReportLineOf
 
 using Lines = std::unordered_map<std::string, ReportLineOf>; // by output
 
-// A line that a killed run left cut is skipped. One that is nested too deeply was not written by a run.
+// A line truncated by a killed run is skipped, and one nested too deeply was not written by a run.
 bool TakeLine(std::string_view text, Lines& lines)
 {
     std::string output;
@@ -58,7 +61,7 @@ bool ReadReport(const std::string& path, Lines& lines)
     return true;
 }
 
-// Of a shard that was not run there is no report yet; its sources are left, and that is told.
+// A shard that has not run has no report yet. Its sources are counted as left, with a message.
 bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines)
 {
     const std::span named = std::span(options.files).subspan(1);
@@ -82,7 +85,7 @@ void SayFailures(const ShellOptions& options, const std::string& line)
         SayReport(options, report);
 }
 
-// Puts the lines into the order of the plan and counts how they ended.
+// Sorts the lines in plan order and counts their results.
 std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines& lines, RunTally& tally)
 {
     std::string joined;

@@ -21,7 +21,7 @@ namespace {
 
 constexpr int64_t kShardLimit = 1'000'000;
 
-// A plan is JSON, which keeps no other names.
+// Plans are JSON, which cannot hold other names.
 bool IsUtf8(const std::string& text)
 {
     CJsonMembers json;
@@ -71,7 +71,7 @@ void TellPlan(const ShellOptions& options, const CRunPlan& plan)
     }
 }
 
-// A slip here would be found only when the shards run.
+// Checked here, because otherwise a typo would show only when the shards run.
 bool AreSourcesThere(const ShellOptions& options)
 {
     for (const std::string& path : options.files)

@@ -22,8 +22,8 @@ struct Entry
     std::string name;
     std::string path;
     bool stock = false;
-    std::optional<CProfileFit> fit;        // with a source
-    std::optional<ProfileVerdict> verdict; // of one that fits
+    std::optional<CProfileFit> fit;        // if a source is given
+    std::optional<ProfileVerdict> verdict; // of a profile that fits
 };
 
 std::vector<Entry> Installed(CShellConversion& conversion)
@@ -43,7 +43,7 @@ CProfileFit FitOf(const CShellConversion& conversion, const ProfileChoice& choic
     return fit;
 }
 
-// The one that a conversion takes first.
+// Sorted, starting with the one that a conversion uses.
 std::vector<Entry> ByFit(CShellConversion& conversion)
 {
     const std::vector<InstalledProfile> installed = conversion.InstalledProfiles();
@@ -59,7 +59,7 @@ std::vector<Entry> ByFit(CShellConversion& conversion)
     return entries;
 }
 
-// What a profile for another skeleton misses is nothing to read.
+// The bones missing for a profile of another skeleton are not worth printing.
 std::string Missing(const CProfileFit& fit)
 {
     return 2 * fit.foundCount < fit.rowCount ? "" : MissingLines(fit);

@@ -17,8 +17,7 @@ namespace gw {
 
 namespace {
 
-// Readers and writers bound what they take by the size of the file, so that only a machine that has less gets
-// here.
+// Readers and writers limit their memory by the file size, so only a machine with less memory gets here.
 EExit RunArguments(int argc, char** argv)
 {
     try
@@ -32,14 +31,14 @@ EExit RunArguments(int argc, char** argv)
     }
 }
 
-// A stream that whoever started the program has closed leaves its number to the next file that is opened,
-// which would then be a result with messages in it.
+// If the caller has closed a standard stream, the next opened file would get its number, and messages would
+// be written into a result.
 void OpenStandardStreams()
 {
     for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
     {
         if (fcntl(stream, F_GETFD) < 0 && errno == EBADF)
-            open("/dev/null", O_RDWR); // takes the lowest number, which is this one
+            open("/dev/null", O_RDWR); // gets the lowest free number, which is this stream's
     }
 }
 
@@ -50,8 +49,8 @@ int RunProgram(int argc, char** argv)
     OpenStandardStreams();
     RemovePrivateFilesOnSignals();
 #ifdef SIGXFSZ
-    // A file size limit answers the write with an error, as a full disk does; by itself it would end the
-    // program and leave half a file.
+    // With the signal ignored, exceeding a file size limit fails the write like a full disk; otherwise it
+    // would end the program and leave half a file.
     std::signal(SIGXFSZ, SIG_IGN);
 #endif
     EExit exit = RunArguments(argc, argv);

@@ -1,3 +1,5 @@
+// `render`: draws a frame, or a strip of poses, into a picture file.
+
 #include "AttachBoneMeshes.h"
 #include "CJsonWriter.h"
 #include "CSceneFile.h"
@@ -25,7 +27,8 @@ PictureMotion Shown(CNode* root, const SourceTiming& timing)
     return {Ref<CNode>(root), timing.FrameStep(), timing.lastFrame};
 }
 
-// The first root that moves, by its first track, dressed so that there is something to see of its bones.
+// Shows the first root that moves, animated by its first track, with bone meshes added so that its bones are
+// visible.
 bool ShowScene(const std::string& path, CSceneFile& file, PictureMotion& motion)
 {
     for (const FoundNode& found : file.Nodes())
@@ -41,7 +44,7 @@ bool ShowScene(const std::string& path, CSceneFile& file, PictureMotion& motion)
     return false;
 }
 
-// The trees outlive the files that they come from.
+// The trees outlive their files.
 bool LoadMotion(const ShellOptions& options, const std::string& path, PictureMotion& motion)
 {
     CSceneFile file;
@@ -65,7 +68,7 @@ int ToInt(int64_t number)
     return static_cast<int>(std::clamp<int64_t>(number, Limits::min(), Limits::max()));
 }
 
-// Places for the motions stand, and nothing is in them yet.
+// Allocates the motions' places in the picture, still empty.
 PictureOptions PictureOf(const ShellOptions& options)
 {
     PictureOptions picture;
@@ -94,7 +97,7 @@ bool CanDraw(const ShellOptions& options, const PictureOptions& picture)
                   std::to_string(kLongestSide) + ", and each pose needs at least one pixel");
 }
 
-// Null for a picture that was not drawn.
+// `picture` is null if none was drawn.
 void WriteJson(const ShellOptions& options, const PictureOptions* picture)
 {
     CJsonWriter json(stdout);

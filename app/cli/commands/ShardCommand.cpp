@@ -12,7 +12,7 @@ namespace gw {
 
 namespace {
 
-// A shard is run as often as it takes: it goes on behind failures, and passes over what is done.
+// A shard can be run repeatedly: it continues after failures and skips what is done.
 bool TakePlan(const CRunPlan& plan, size_t shard, ShellOptions& options)
 {
     std::string wrong;

@@ -1,3 +1,6 @@
+// `suggest`: drafts a bone map for a motion without a fitting one, writes it, and prints its rows with the
+// confidence in each, so that a user knows what to check.
+
 #include "CFileConversion.h"
 #include "CJsonWriter.h"
 #include "CReport.h"
@@ -147,7 +150,7 @@ void WriteJson(const ShellOptions& options, const std::string& name, const Sugge
     json.EndDocument();
 }
 
-// Says which of the thirteen joints were not found.
+// Prints which of the thirteen required joints were not found.
 EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
 {
     std::string words = Printable(source) + ": no complete body was found by names or shape; missing: ";
@@ -173,7 +176,7 @@ bool WriteProfile(const std::string& path, const std::string& text)
     return false;
 }
 
-// Results last as long as the source only if the profile has the source's rate.
+// Results are as long as the source only if the profile has the source's rate.
 void WarnOfRate(const ShellOptions& options, int sourceRate, int profileRate)
 {
     if (sourceRate == profileRate)

@@ -37,7 +37,7 @@ bool CanTranscode(const ShellOptions& options)
     return false;
 }
 
-// A .bvh is written without the last frame, and its frame time has six digits behind the point.
+// A .bvh is written without the last frame, and its frame time has six decimals.
 const char* WhyNoBVH(const CMotionFile& motion)
 {
     constexpr float kLeastFrameTime = 0.0000005f;

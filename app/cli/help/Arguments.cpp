@@ -1,3 +1,6 @@
+// Builds the parser from the option and command tables, so that help, completion and parsing never differ.
+// Numbers are parsed by our own functions, which ignore the locale and reject trailing characters.
+
 #include "Arguments.h"
 
 #include "Completion.h"
@@ -20,7 +23,7 @@ namespace gw {
 
 namespace {
 
-// False for a text with anything but a number that the integer holds.
+// Returns false unless the text is a number that fits into the integer.
 template <class T>
 bool ScanInteger(std::string_view text, T& number)
 {
@@ -28,7 +31,7 @@ bool ScanInteger(std::string_view text, T& number)
     return error == std::errc() && end == text.data() + text.size();
 }
 
-// The same for a number that 32 bits hold.
+// Same for a number that fits into 32 bits.
 bool ScanNumber(std::string_view text, float& number)
 {
     ENumber kind = ENumber::None;
@@ -36,7 +39,7 @@ bool ScanNumber(std::string_view text, float& number)
     return kind == ENumber::Whole && std::isfinite(number);
 }
 
-// Tells the parser of an option, by what its value is.
+// Registers an option with the parser, according to the type of its value.
 class OptionBinder
 {
 public:
@@ -93,8 +96,8 @@ public:
     }
 
 private:
-    // Numbers are read by the project's own means, which know no locale and take nothing for a number that is
-    // none.
+    // Numbers are parsed by our own functions, which ignore the locale and reject anything that is not a
+    // number.
     CLI::Option* Add(const std::function<void(const std::string&)>& take) const
     {
         return app_.add_option_function<std::string>(std::string(row_.names), take);
@@ -134,7 +137,7 @@ void AddOptions(CLI::App& app, const ShellCommand& command, ShellOptions& option
     app.allow_extras();
 }
 
-// How many of the options of which one must be there a command line has.
+// Counts how many of the options of an exclusive choice a command line has.
 size_t CountChosen(const CLI::App& app, const ShellCommand& command)
 {
     size_t chosen = 0;
@@ -143,7 +146,7 @@ size_t CountChosen(const CLI::App& app, const ShellCommand& command)
     return chosen;
 }
 
-// All forms of the options that a command takes: "-o", "--output", ...
+// Returns all forms of a command's options: "-o", "--output", ...
 std::vector<std::string> OptionNames(const ShellCommand& command)
 {
     std::vector<std::string> names{"--help"};
@@ -169,7 +172,7 @@ EExit RefuseFor(const ShellCommand& command, std::string_view words, std::string
     return Refuse(words, nearest, "usage: " + UsageLine(command));
 }
 
-// An option that the command does not have; with "=value" behind it or not.
+// Reports an option that the command does not have, with or without "=value".
 EExit RefuseUnknown(const ShellCommand& command, const std::string& argument)
 {
     const std::string name = argument.substr(0, argument.find('='));
@@ -191,7 +194,7 @@ EExit Print(const std::string& text)
     return EExit::Done;
 }
 
-// Nothing where the command may run. A wrong option is told before what is missing.
+// Returns nothing if the command can run. Unknown options are reported before missing ones.
 std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv, ShellOptions& options)
 {
     CLI::App app;
@@ -227,7 +230,8 @@ std::string Version()
     return "gaitwright " GAITWRIGHT_VERSION "\n";
 }
 
-// What the program tells of itself, in the place of a command. The last ones are for who packages it.
+// Options that print information about the program instead of running a command. The last ones are for
+// packagers.
 struct SelfRow
 {
     std::string_view words;

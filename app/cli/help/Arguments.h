@@ -6,16 +6,16 @@ namespace gw {
 
 struct ShellCommand;
 
-/// What came of reading a command line: a command to run, or an exit code where everything is said already.
+/// The result of parsing a command line: a command to run, or the exit code if nothing is left to do.
 struct Arguments
 {
     const ShellCommand* command = nullptr;
     ShellOptions options;
-    EExit exit = EExit::Done; ///< counts where there is no command
+    EExit exit = EExit::Done; ///< used if there is no command
 };
 
-/// Reads a command line. Help goes to standard output; what is wrong goes to standard error with the nearest
-/// right word.
+/// Parses a command line. Help goes to standard output; errors go to standard error, with the most similar
+/// valid word.
 Arguments ParseArguments(int argc, char** argv);
 
 } // namespace gw

@@ -5,9 +5,8 @@ namespace gw {
 
 namespace {
 
-// What stands in every script; the table's part is what _gaitwright chooses among them. Nothing of a word or
-// of a file name is expanded or run. COMP_WORDS holds words as they were typed, backslashes and quotes
-// included.
+// The fixed part of every script; the generated part is what _gaitwright selects from. Words and file names
+// are never expanded or executed. COMP_WORDS contains words as typed, including backslashes and quotes.
 constexpr std::string_view kFunctions =
     R"bash(# bash completion for gaitwright, written by 'gaitwright --completion bash'
 

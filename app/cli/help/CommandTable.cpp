@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// Rows are calls, which the formatter leaves as they are read.
+// Rows are function calls, because the formatter keeps their layout.
 constexpr ShellCommand Row(std::string_view name, std::string_view operands, uint64_t options,
                            uint64_t required, EExit (*run)(const ShellOptions&), std::string_view help,
                            std::string_view example, uint64_t choice = 0)
@@ -14,7 +14,7 @@ constexpr ShellCommand Row(std::string_view name, std::string_view operands, uin
     return {name, operands, options, required, run, help, example, choice};
 }
 
-// Of a run over many files.
+// Options of runs over many files.
 constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit;
 
 constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |

@@ -46,8 +46,9 @@ enum EOption : uint64_t
     kShard = 1ull << 32,
 };
 
-/// The options that say how a run goes, and nothing about what a source is converted to. Any other is part of
-/// a plan, and of what --resume compares: one too many there costs time, one too few would leave old results.
+/// Options that control how a run works, but not what a source is converted to. All others are part of a
+/// plan, and of what --resume compares: one too many there costs time, one too few would keep outdated
+/// results.
 inline constexpr uint64_t kHowToRun = kOutput | kOutputFolder | kForce | kSkipExisting | kDryRun |
                                       kKeepGoing | kDataFolder | kJson | kQuiet | kJobs | kFilesFrom | kNull |
                                       kResume | kReport | kTimeLimit | kShards | kShard;
@@ -56,23 +57,23 @@ inline constexpr uint64_t kHowToRun = kOutput | kOutputFolder | kForce | kSkipEx
 struct ShellCommand
 {
     std::string_view name;
-    std::string_view operands; ///< as the usage line shows them: "IN OUT", "[SOURCE]", "SOURCE..."
-    uint64_t options;          ///< bits of EOption beside those that every command takes
-    uint64_t required;         ///< which of them must be there
+    std::string_view operands; ///< as shown in the usage line: "IN OUT", "[SOURCE]", "SOURCE..."
+    uint64_t options;          ///< bits of EOption, in addition to those of every command
+    uint64_t required;         ///< the required ones
     EExit (*run)(const ShellOptions& options);
-    std::string_view help; ///< the first line stands in the list of commands
+    std::string_view help; ///< the first line is shown in the list of commands
     std::string_view example;
-    uint64_t choice; ///< of these exactly one must be there; 0 for no such choice
+    uint64_t choice; ///< exactly one of these is required; 0 for no such choice
 };
 
-/// How many operands a command takes.
+/// Returns the minimum number of operands of a command.
 size_t LeastOperands(const ShellCommand& command);
 size_t MostOperands(const ShellCommand& command);
 
-/// The table of commands, in the order of the help.
+/// Returns the commands, in help order.
 std::span<const ShellCommand> Commands();
 
-// The commands. Each prints results on standard output and words on standard error.
+// The commands. Each prints results to standard output and messages to standard error.
 EExit RunConvert(const ShellOptions& options);
 EExit RunBatchFolder(const ShellOptions& options);
 EExit RunPlan(const ShellOptions& options);

@@ -8,8 +8,7 @@ namespace gw {
 
 namespace {
 
-// The words of usage lines that tell what they stand for. Any other is a file, or a number where it is read
-// as one.
+// Words in usage lines with a special meaning. Any other word is a file, or a number if it is parsed as one.
 struct WordRow
 {
     std::string_view name;

@@ -4,8 +4,8 @@
 
 namespace gw {
 
-// The scripts that tell a shell the program's commands, their options and what may stand behind these, all
-// from the tables.
+// Generate the completion scripts, which contain the program's commands, their options and the options'
+// values, all from the tables.
 std::string BashCompletion();
 std::string FishCompletion();
 std::string ZshCompletion();

@@ -48,7 +48,7 @@ std::string Offer(const CompletedWord& word)
     return " -r -F";
 }
 
-// A line begins with the commands that it is for.
+// A line starts with the commands that it applies to.
 std::string Line(const std::string& commands)
 {
     return "complete -c gaitwright -n '__fish_seen_subcommand_from" + commands + '\'';

@@ -29,7 +29,7 @@ constexpr std::string_view kTail = ".SH FILES\n"
                                    ".SH SEE ALSO\n"
                                    ".BR GaitForge (1)\n";
 
-// A text as man takes it: no character that commands it, and minus signs that can be copied into a shell.
+// Escapes a text for man: no control characters, and minus signs that can be copied into a shell.
 std::string Escaped(std::string_view text)
 {
     std::string escaped;
@@ -54,13 +54,13 @@ std::string Bold(std::string_view text)
     return "\\fB" + Escaped(text) + "\\fR";
 }
 
-// The value of an option, or the operands of a command.
+// Formats the value of an option, or the operands of a command.
 std::string Slanted(std::string_view text)
 {
     return text.empty() ? std::string() : " \\fI" + Escaped(text) + "\\fR";
 }
 
-// "-o, --output OUT" and what it does.
+// Formats "-o, --output OUT" and its description.
 std::string OptionEntry(std::string_view names, std::string_view value, std::string_view help)
 {
     std::string bold;
@@ -77,7 +77,7 @@ std::string OptionEntries(uint64_t bits)
     return text;
 }
 
-// Options that every command accepts; the page lists them once.
+// Options of every command, which the page lists once.
 uint64_t SharedOptions()
 {
     uint64_t shared = ~uint64_t{0};
@@ -86,7 +86,7 @@ uint64_t SharedOptions()
     return shared;
 }
 
-// The first line of a help text is a separate sentence; the rest was wrapped by hand.
+// The first line of a help text is a separate sentence; the rest is wrapped by hand.
 std::string CommandEntry(const ShellCommand& command)
 {
     const std::string_view help = command.help;

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// The program's man page, in the language of man(7): every command and option of the tables.
+/// Returns the program's man page, in man(7) format: every command and option of the tables.
 std::string ManPage();
 
 } // namespace gw

@@ -68,7 +68,7 @@ constexpr OptionRow kOptions[] = {
     Row(kQuiet, "--quiet", "", &ShellOptions::quiet, "print errors only"),
 };
 
-constexpr size_t kColumn = 26; // where the second column of a help begins
+constexpr size_t kColumn = 26; // start of the second column of a help text
 
 void AppendRow(std::string& text, std::string_view left, std::string_view right)
 {
@@ -80,7 +80,7 @@ void AppendRow(std::string& text, std::string_view left, std::string_view right)
     text += line + std::string(right) + '\n';
 }
 
-// The option as shown in a usage line or a help text: its names and its value.
+// Returns an option's names and value as shown in usage lines and help texts.
 std::string Shown(const OptionRow& row, std::string_view names)
 {
     return std::string(names) + (row.value.empty() ? "" : " ") + std::string(row.value);

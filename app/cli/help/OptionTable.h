@@ -7,39 +7,39 @@
 
 namespace gw {
 
-/// Where an option's value goes, which also says what it is: a switch, a text, a number above 0, any number,
-/// an integer, a whole number from 0 on, a size.
+/// The field that receives an option's value, whose type is also the type of the option: a switch, a text, a
+/// positive number, any number, an integer, a non-negative integer, a size.
 using COptionTarget = std::variant<bool ShellOptions::*, std::string ShellOptions::*, float ShellOptions::*,
                                    std::optional<float> ShellOptions::*, int64_t ShellOptions::*,
                                    std::optional<int64_t> ShellOptions::*, PixelSize ShellOptions::*>;
 
-/// One option of the program.
+/// An option of the program.
 struct OptionRow
 {
     EOption bit;
     std::string_view names; ///< "-o,--output"
-    std::string_view value; ///< what stands behind it, as the help shows it; empty for a switch
+    std::string_view value; ///< the value's name in the help; empty for a switch
     COptionTarget target;
     std::string_view help;
-    std::string_view choices; ///< the words that may stand behind it, with "|" between them; empty for any
+    std::string_view choices; ///< allowed values, separated by "|"; empty for any
 };
 
-/// The table of options, in the order of the help.
+/// Returns the options, in help order.
 std::span<const OptionRow> OptionTable();
 
-/// What the program's answer to the shell means.
+/// Meaning of the exit codes.
 inline constexpr std::string_view kExitCodes = "0 done, 1 some work failed, 2 wrong usage, 130 interrupted.";
 
-/// The bits of all options that a command takes.
+/// Returns the bits of all options of a command.
 uint64_t OptionsOf(const ShellCommand& command);
 
-/// The help of the program: every command with a line.
+/// Returns the program's help: one line per command.
 std::string ProgramHelp();
-/// The help of a command: usage, what it does, options, an example.
+/// Returns a command's help: usage, description, options, example.
 std::string CommandHelp(const ShellCommand& command);
-/// "gaitwright pose FILE --frame N [OPTIONS]".
+/// Returns "gaitwright pose FILE --frame N [OPTIONS]".
 std::string UsageLine(const ShellCommand& command);
-/// The options that a command takes one of: "--frame N | --time T".
+/// Returns the options of which a command needs exactly one: "--frame N | --time T".
 std::string ChoiceText(const ShellCommand& command);
 
 } // namespace gw

@@ -7,44 +7,45 @@
 
 namespace gw {
 
-/// What the program answers to the shell.
+/// Exit codes.
 enum class EExit : int
 {
     Done = 0,
     Failed = 1,        ///< some work failed
-    Usage = 2,         ///< the command line was wrong, and nothing was done
-    Interrupted = 130, ///< an end was requested before all was done
+    Usage = 2,         ///< wrong command line; nothing was done
+    Interrupted = 130, ///< interrupted before everything was done
 };
 
-/// Of a picture, as the command line says it; not yet looked at by whoever draws.
+/// A picture size from the command line, not yet checked.
 struct PixelSize
 {
     int width = 640;
     int height = 480;
 };
 
-/// What a command line asks for. One record serves all commands; each reads what its row in the table of
-/// commands lets through.
+/// The parsed command line. All commands share this record; each reads the options that its row in the
+/// command table allows.
 struct ShellOptions
 {
-    std::vector<std::string> files; ///< operands, in the order of the command line
+    std::vector<std::string> files; ///< operands, in order
 
-    std::string output;          ///< -o
-    std::string outputFolder;    ///< --out-dir
-    std::string profile;         ///< a display name, or the path of a .prf file
-    std::string dataFolder;      ///< replaces the folder beside the executable; empty for that
-    std::string job;             ///< htr or orn
-    std::string html;            ///< --html, the page to write; empty for none
-    std::string fix;             ///< --fix, the mended copy to write; empty for none
-    std::string filesFrom;       ///< --files-from, a list of sources; "-" for standard input, empty for none
-    std::string report;          ///< --report, the file that takes a line a source; empty for none
-    std::optional<int64_t> jobs; ///< worker processes; none for as many as there are cores
+    std::string output;       ///< -o
+    std::string outputFolder; ///< --out-dir
+    std::string profile;      ///< display name, or path of a .prf file
+    std::string dataFolder;   ///< replaces the folder next to the executable; empty for that folder
+    std::string job;          ///< htr or orn
+    std::string html;         ///< --html, the page to write; empty for no page
+    std::string fix;          ///< --fix, the repaired copy to write; empty for no copy
+    /// --files-from, a list of sources; "-" for standard input, empty for no list
+    std::string filesFrom;
+    std::string report;            ///< --report, the file that gets one line per source; empty for no report
+    std::optional<int64_t> jobs;   ///< worker processes; default: one per core
     std::optional<int64_t> shards; ///< parts of a plan
-    std::optional<int64_t> shard;  ///< the part to run, from 0 on
-    float timeLimit = 600.0f;      ///< seconds that one source may take
+    std::optional<int64_t> shard;  ///< the part to run, starting at 0
+    float timeLimit = 600.0f;      ///< seconds per source
     int64_t frame = 0;
-    std::optional<float> time; ///< --time, in place of a frame; in the unit of the file's controls
-    std::string with;          ///< the motion to draw beside the first one; empty for none
+    std::optional<float> time; ///< --time, instead of a frame; in the unit of the file's controls
+    std::string with;          ///< the motion to draw next to the first one; empty for none
     int64_t strip = 1;         ///< number of poses
     PixelSize size;
     float rate = 0.0f;       ///< frames per second
@@ -52,17 +53,17 @@ struct ShellOptions
 
     bool json = false;
     bool quiet = false;
-    bool force = false;         ///< replace outputs that exist
-    bool skipExisting = false;  ///< pass over sources whose output exists
-    bool dryRun = false;        ///< say what would be done
-    bool noLegs = false;        ///< leave the feet to the plain rotation transfer
-    bool keepGoing = false;     ///< go on behind a source that failed
-    bool resume = false;        ///< pass over sources whose output is what an earlier run made of them
-    bool nullSeparated = false; ///< the list of sources has zero bytes between its names
-    bool align = false;         ///< tell the source from a rest pose that suits the rules first
-    bool faithful = false;      ///< let hips, knees and feet keep to the source
+    bool force = false;         ///< replace existing outputs
+    bool skipExisting = false;  ///< skip sources whose output exists
+    bool dryRun = false;        ///< only print what would be done
+    bool noLegs = false;        ///< transfer rotations only, without planting feet
+    bool keepGoing = false;     ///< continue after a source that failed
+    bool resume = false;        ///< skip sources whose output is already up to date
+    bool nullSeparated = false; ///< the names in the list of sources are separated by zero bytes
+    bool align = false;         ///< first re-express the source relative to a T-pose
+    bool faithful = false;      ///< keep hips, knees and feet close to the source
     bool check = false;         ///< measure each result
-    bool objects = false;       ///< tell all spatial objects, not nodes alone
+    bool objects = false;       ///< print all spatial objects, not only nodes
 };
 
 } // namespace gw

@@ -19,7 +19,7 @@ _gaitwright() {
     local -a commands
 )zsh";
 
-// A text within single quotes, in the brackets of a word of _arguments.
+// Quotes a text within single quotes, inside the brackets of an _arguments word.
 std::string ZshQuoted(std::string_view text)
 {
     std::string quoted;
@@ -32,7 +32,7 @@ std::string ZshQuoted(std::string_view text)
     return quoted;
 }
 
-// ":SOURCE:_files ..."
+// Returns ":SOURCE:_files ...".
 std::string Action(const CompletedWord& word)
 {
     const std::string message = ':' + ZshQuoted(word.name) + ':';
@@ -55,7 +55,7 @@ std::string Action(const CompletedWord& word)
            (word.words.empty() ? "_files" : "_files -g \"*.(#i)(" + Joined(word.words, "|") + ")\"");
 }
 
-// "'(-o --output)'{-o,--output}'[the file to write]:OUT:_files'"
+// Returns "'(-o --output)'{-o,--output}'[the file to write]:OUT:_files'".
 std::string OptionWord(const OptionRow& row)
 {
     const std::vector<std::string_view> names = Parts(row.names, ",");

@@ -9,10 +9,10 @@ namespace gw {
 
 namespace {
 
-// How one value of a kind becomes JSON.
+// How a value of each kind is converted to JSON.
 struct KindRow
 {
-    size_t floats; // how many floats it is made of, or 0
+    size_t floats; // number of floats in it, or 0
     int64_t (*integer)(const void* value);
 };
 
@@ -62,7 +62,8 @@ std::string Hex(const std::byte* bytes, size_t count)
     return text;
 }
 
-// Embedded files and pictures tell nobody anything byte by byte: of a long block the beginning is shown.
+// The bytes of embedded files and pictures are not useful to read, so only the start of a long block is
+// shown.
 void WriteBytes(CJsonWriter& json, const std::byte* bytes, size_t count)
 {
     constexpr size_t kShownBytes = 64;

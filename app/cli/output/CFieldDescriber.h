@@ -14,19 +14,19 @@ namespace gw {
 
 class CJsonWriter;
 
-/// The numbers by which a report names the objects of a scene.
+/// The numbers that a report uses for the objects of a scene.
 using CObjectNumbers = std::unordered_map<const CObject*, size_t>;
 
-/// What is told of an object's fields.
+/// Which of an object's fields are described.
 enum class EDescribe : uint8_t
 {
-    Links,  ///< references to other objects, as their numbers; null for none and for what the scene does not
-            ///< hold
+    /// references to other objects, as their numbers; null for no object and for objects outside the scene
+    Links,
     Fields, ///< everything else
 };
 
-/// Writes an object's fields as members of a JSON object, by name and in file order: vectors, quaternions
-/// (w x y z) and matrices as arrays of numbers, a block of bytes as hex. Links inside a list of records stay
+/// Writes an object's fields as members of a JSON object, by name and in file order: vectors, quaternions (w
+/// x y z) and matrices as arrays of numbers, byte blocks as hex. Links inside a list of records are written
 /// with their record.
 class CFieldDescriber : public CFieldArchive
 {
@@ -50,11 +50,10 @@ protected:
     void EndElement() override;
 
 private:
-    // A count that belongs to the field behind it where that has the same name, and is a field itself
-    // otherwise.
+    // A count that belongs to the next field if that has the same name, and is a field by itself otherwise.
     struct PendingCount
     {
-        std::string_view name; ///< empty for none
+        std::string_view name; ///< empty if there is no pending count
         size_t count = 0;
     };
 
@@ -66,10 +65,10 @@ private:
     CJsonWriter& json_;
     const CObjectNumbers& numbers_;
     PendingCount m_kCount;
-    std::vector<bool> m_kNest; ///< arrays (true) and their elements (false) around the present place
+    std::vector<bool> m_kNest; ///< arrays (true) and elements (false) around the current field
     bool m_bArrayIsTold = false;
     std::map<std::string, int, std::less<>>
-        m_kSeen; ///< members so far, since a list may name two fields alike
+        m_kSeen; ///< members so far, because a list can contain two fields with the same name
 };
 
 } // namespace gw

@@ -11,8 +11,7 @@ namespace {
 
 constexpr size_t kGatherBytes = size_t{1} << 16;
 
-// The library escapes control characters below U+0020 only. Those from U+007F to U+009F command terminals
-// too.
+// The library only escapes control characters below U+0020. Terminals also obey those from U+007F to U+009F.
 std::string WithEscapedControls(const std::string& json)
 {
     std::string escaped;
@@ -20,7 +19,7 @@ std::string WithEscapedControls(const std::string& json)
     for (size_t i = 0; i < json.size(); ++i)
     {
         const bool isPair =
-            json[i] == '\xc2' && static_cast<unsigned char>(json[i + 1]) < 0xa0; // valid UTF-8
+            json[i] == '\xc2' && static_cast<unsigned char>(json[i + 1]) < 0xa0; // the input is valid UTF-8
         if (!isPair && json[i] != '\x7f')
         {
             escaped += json[i];

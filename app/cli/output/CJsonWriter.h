@@ -8,9 +8,9 @@
 
 namespace gw {
 
-/// JSON on its way to a file, written as it comes: a large scene is never in memory a second time. What is no
-/// number becomes the text "nan", "inf" or "-inf", bytes that are no UTF-8 become U+FFFD, and all control
-/// characters are escaped, so that every reader accepts the result and no terminal obeys it.
+/// Writes JSON to a file as it is generated, so a large scene is not in memory twice. NaN and infinities
+/// become the texts "nan", "inf" and "-inf", bytes that are not UTF-8 become U+FFFD, and all control
+/// characters are escaped, so that every parser accepts the result and no terminal is affected.
 class CJsonWriter
 {
 public:
@@ -23,7 +23,7 @@ public:
     void EndObject() { End('}'); }
     void BeginArray() { Begin('['); }
     void EndArray() { End(']'); }
-    /// The key of the value that comes next.
+    /// Writes the key of the next value.
     CJsonWriter& Key(std::string_view name);
 
     void Text(std::string_view text);
@@ -33,9 +33,9 @@ public:
     void Null() { Plain("null"); }
     void Numbers(std::span<const float> values);
 
-    /// The next value of an array, or its end, begins a line.
+    /// Starts a new line before the next value of an array, or its end.
     void BreakLine() { m_bBreak = true; }
-    /// Ends a document with a line end; another may follow.
+    /// Ends a document with a line end; another can follow.
     void EndDocument();
 
 private:

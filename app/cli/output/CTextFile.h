@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// A file in memory, for writers that know files only.
+/// A file in memory, for functions that can only write to files.
 class CTextFile
 {
 public:
@@ -20,9 +20,9 @@ public:
     CTextFile(const CTextFile&) = delete;
     CTextFile& operator=(const CTextFile&) = delete;
 
-    /// Null where there is no memory.
+    /// Returns the file, or null if there is not enough memory.
     std::FILE* File() { return m_pkFile; }
-    /// What was written up to now.
+    /// Returns the text written so far.
     std::string Text()
     {
         if (m_pkFile)

@@ -14,16 +14,16 @@ namespace {
 
 constexpr const char* kSurenessNames[] = {"sure", "likely", "doubtful"};
 
-// A name for programs, and the sentence that people read, in pieces around the names of joints.
+// A code for programs, and a sentence for people, in pieces around joint names.
 struct DoubtText
 {
     const char* name;
     const char* before;
-    const char* between; // between the names of two joints; null if only one is named
+    const char* between; // between two joint names; null if only one is named
     const char* behind;
 };
 
-// In the order of EBodyDoubt.
+// In EBodyDoubt order.
 constexpr DoubtText kPlaceTexts[] = {
     {"not-below",       "",                                 nullptr, " is not below the expected parent joint"                 },
     {"sides-swapped",   "",                                 nullptr, " is on the other side: left and right are swapped"       },
@@ -33,7 +33,7 @@ constexpr DoubtText kPlaceTexts[] = {
     {"odd-length",      "the bone lengths in the limb of ", nullptr, " look wrong"                                             },
 };
 
-// In the order of EProfileDoubt, after the first one.
+// In EProfileDoubt order, without the first one.
 constexpr DoubtText kTexts[] = {
     {"other-name", "it uses ",                   " although ", " is the joint by name"    },
     {"spine-cut",  "the spine continues above ", " up to ",    ""                         },
@@ -54,7 +54,7 @@ std::string Sentence(const ProfileDoubt& doubt)
     return text.before + Quoted(doubt.joint) + other + text.behind;
 }
 
-// If one bone ends up rotated, many do: they share a sentence that names only a few.
+// If one bone is misrotated, many are: they share a sentence that names only a few.
 std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
 {
     constexpr size_t kNamed = 4;

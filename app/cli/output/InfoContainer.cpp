@@ -1,3 +1,5 @@
+// The container part of `info`: roots, objects and package blocks, as text or JSON.
+
 #include "InfoContainer.h"
 
 #include "CCustomData.h"
@@ -83,7 +85,7 @@ void WriteObject(CJsonWriter& json, CObject& object, bool isRoot, const CObjectN
 
 void PrintIndented(size_t depth, const std::string& line)
 {
-    constexpr size_t kDeepest = 60; // a line is for reading; a hostile file nests thousands of levels
+    constexpr size_t kDeepest = 60; // lines are for reading, and a hostile file nests thousands of levels
     std::printf("%*s%s\n", static_cast<int>(2 * std::min(depth, kDeepest)), "", line.c_str());
 }
 

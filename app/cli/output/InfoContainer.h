@@ -8,14 +8,14 @@ namespace gw {
 class CJsonWriter;
 class COrrinStream;
 
-/// A line of a tree on standard output. Very deep levels stand below each other.
+/// Prints a line of a tree. Very deep levels are not indented further.
 void PrintIndented(size_t depth, const std::string& line);
 
-/// Version, roots and objects of a container, and the two data blocks of a Kinetra file, on standard output.
+/// Prints version, roots and objects of a container, and the two data blocks of a Kinetra file.
 void PrintContainer(COrrinStream& scene);
-/// Its objects as a tree, each at the first of its places.
+/// Prints its objects as a tree, each at its first place.
 void PrintObjects(COrrinStream& scene);
-/// The same as members of a JSON object: every object with class, name, links and fields.
+/// Writes the same as members of a JSON object: every object with class, name, links and fields.
 void WriteContainer(CJsonWriter& json, COrrinStream& scene);
 
 } // namespace gw

@@ -8,23 +8,23 @@
 
 namespace gw {
 
-/// Whether a command line does not ask for both --force and --skip-existing. Says that they exclude each
-/// other.
+/// Returns whether a command line does not have both --force and --skip-existing, which exclude each other;
+/// prints an error if it does.
 bool IsDecidedOnExisting(const ShellOptions& options);
-/// Whether there is something at a path already, a dangling link included.
+/// Returns whether anything exists at a path, including a dangling link.
 bool IsTaken(const std::string& path);
-/// The failure of a folder whose files cannot be listed.
+/// Returns the failure for a folder whose files cannot be listed.
 CReport UnreadableFolder(const std::string& path);
-/// Whether the files of a folder can be listed. Says so if not.
+/// Returns whether the files of a folder can be listed; prints an error if not.
 bool CanListFolder(const ShellOptions& options, const std::string& path);
-/// Whether two paths lead to one existing file.
+/// Returns whether two paths refer to the same existing file.
 bool IsSameFile(const std::string& a, const std::string& b);
-/// Why a command may not write a file: it is there without --force, or it is a folder. Without --force,
-/// saving to a path that may be written also fails if a file appears there first.
+/// Returns why a command must not write a file: it exists and --force is missing, or it is a folder. Without
+/// --force, saving to a writable path also fails if a file appears there first.
 std::optional<CReport> WhyNotWrite(const ShellOptions& options, const std::string& path);
-/// Whether a command may write a file. Says why not.
+/// Returns whether a command may write a file; prints an error if not.
 bool MayWrite(const ShellOptions& options, const std::string& path);
-/// Tells on standard output what was made of what. Answers Done.
+/// Prints which source was written to which output. Returns Done.
 EExit TellWritten(const ShellOptions& options, const std::string& source, const std::string& output);
 
 } // namespace gw

@@ -10,9 +10,9 @@ namespace gw {
 
 namespace {
 
-static_assert(sizeof(PackageFacts) == 16); // as it lies in the file
+static_assert(sizeof(PackageFacts) == 16); // layout of the file
 
-// A chain is as long as the objects in the file, and a ring is refused when it is read.
+// A chain is no longer than the number of objects in the file, and cycles are refused when it is read.
 CRawData* FindInChain(CCustomData* data, const char* name)
 {
     for (; data; data = data->GetNextData())

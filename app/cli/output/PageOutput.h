@@ -6,20 +6,20 @@ namespace gw {
 
 class CConversionPage;
 
-/// Whether a page is to be written.
+/// Returns whether a page was requested.
 inline bool IsPageAsked(const ShellOptions& options)
 {
     return !options.html.empty() && !options.dryRun;
 }
 
-/// Whether --html names a page that may be written; Done without one. Says what is wrong: a page ends in
-/// .html or .htm, so that a slip replaces no motion, and one that exists wants --force.
+/// Checks that --html, if present, names a page that can be written; prints an error if not. A page must end
+/// in .html or .htm, so that a typo cannot replace a motion, and an existing one requires --force.
 EExit CheckPagePath(const ShellOptions& options);
 
-/// Whether the folder of the page is there, so that nobody learns behind a long run that it is not. Says so.
+/// Checks that the folder of the page exists, before a long run; prints an error if not.
 bool HasPageFolder(const ShellOptions& options);
 
-/// Writes the page in one step. Says where it is, or that it cannot be written.
+/// Writes the page atomically. Prints its path, or an error.
 bool WritePage(const ShellOptions& options, CConversionPage& page);
 
 } // namespace gw

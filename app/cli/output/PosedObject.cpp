@@ -60,7 +60,7 @@ void WriteColor(CJsonWriter& json, const CLight& light)
     WriteVector(json, light.m_kRGB);
 }
 
-// Runs a writer on an object of its class or one derived from it.
+// Calls a writer if the object is of its class or a derived one.
 template <class T>
 void WriteAs(CJsonWriter& json, CSpatial& object, void (*write)(CJsonWriter&, T&))
 {

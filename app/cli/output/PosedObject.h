@@ -5,7 +5,7 @@ namespace gw {
 class CJsonWriter;
 class CSpatial;
 
-/// Writes what an update has left in an object: matrices and bound, and what else its class has.
+/// Writes an object's state after an update: matrices, bound, and the values of its class.
 void WritePosedObject(CJsonWriter& json, CSpatial& object);
 
 } // namespace gw

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// The text of TreeView.js, which the tree page of an object dump wants beside it.
+/// The text of TreeView.js, which the tree page of an object dump needs next to it.
 extern const std::string_view kTreeViewScript;
 
 } // namespace gw

@@ -24,7 +24,7 @@ CBatchRun::CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CSh
 {
 }
 
-// The profile is read from its file again for every source, unless it was adapted, which no file has.
+// The profile is read from its file again for every source, unless it was adapted and has no file.
 EBatchStep CBatchRun::ConvertMotion(const ConversionJob& job)
 {
     if (!conversion_.LoadSource(job.source))
@@ -47,7 +47,8 @@ EBatchStep CBatchRun::RunJob(const ConversionJob& job)
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 
-// A file of which a failure is told counts as failed, and ends the run only where the desktop program's ends.
+// A file whose failure is reported counts as failed, but ends the run only if the desktop program's run would
+// end.
 CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     const ConversionJob& job = AllJobs()[index];

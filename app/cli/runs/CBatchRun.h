@@ -11,18 +11,18 @@ namespace gw {
 class CShellConversion;
 class CShellReports;
 
-/// The folder run of the desktop program: one profile for all, chosen before it begins, and its own words.
-/// Every worker has the conversion as it stands then.
+/// The desktop program's batch run: one profile for all files, chosen before it begins, with its own
+/// messages. Every worker inherits the conversion in the state at its start.
 class CBatchRun : public CFileRun
 {
 public:
-    /// Conversion and reports must outlive the run, and so must the options.
+    /// Conversion, reports and options must outlive the run.
     CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
               CShellReports& reports);
 
-    /// Everything that was reported of the files, in order.
+    /// Returns all reports about the files, in order.
     const std::vector<CReport>& Reports() const { return m_kReports; }
-    /// Number of files that were taken up.
+    /// Returns the number of files that were started.
     size_t TakenCount() const { return m_uiTaken; }
 
 protected:
@@ -45,7 +45,7 @@ private:
     size_t m_uiTaken = 0;
 };
 
-/// What the option --job asks for.
+/// Returns the job for the option --job.
 EBatchJob BatchJobOf(const ShellOptions& options);
 
 } // namespace gw

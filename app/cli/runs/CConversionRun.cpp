@@ -39,7 +39,7 @@ void CConversionRun::TellUpToDate(size_t index)
     TellSkipped(Options(), AllJobs()[index], "the output is up to date");
 }
 
-// The one that is asked for, or all among which each source chooses.
+// The requested profile, or all those that each source chooses from.
 bool CConversionRun::AddProfiles(CContentHash& key)
 {
     CShellReports reports(Options());
@@ -55,7 +55,7 @@ bool CConversionRun::AddProfiles(CContentHash& key)
     return true;
 }
 
-// Nothing stays for the next conversion, which may be none.
+// Moved out, because the next job may not be a conversion.
 std::string CConversionRun::Enclosure()
 {
     return std::exchange(m_kDrawn, {});

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// Many conversions as `convert` makes them, each from nothing.
+/// Many independent conversions, as made by `convert`.
 class CConversionRun : public CFileRun
 {
 public:
@@ -24,7 +24,7 @@ protected:
 private:
     bool FinishPage();
 
-    std::string m_kDrawn; ///< what the page shows of the last conversion, in a worker
+    std::string m_kDrawn; ///< the page's part of the last conversion, in a worker
     CConversionPage m_kPage;
     size_t m_uiTaken = 0;
 };

@@ -1,3 +1,8 @@
+// A run of many conversions. Workers convert; the program prints, writes reports and keeps the state for
+// --resume. Whether a source is up to date depends on a key: a hash of program version, options, profiles,
+// skeleton and source. The steps around a result are ordered so that a crash at any point loses no result and
+// claims none that does not exist; see CResumeState.h.
+
 #include "CFileRun.h"
 
 #include "CContentHash.h"
@@ -40,7 +45,7 @@ size_t WorkerCount(const ShellOptions& options, size_t jobCount)
     return std::min(options.jobs ? static_cast<size_t>(*options.jobs) : cores, jobCount);
 }
 
-// The members of a record that are the run's to say; what follows stays the same from run to run.
+// The members of a record that the run itself knows; the rest is the same in every run.
 std::string RecordHead(const ConversionJob& job)
 {
     CTextFile text;
@@ -53,7 +58,7 @@ std::string RecordHead(const ConversionJob& job)
     return text.Text() + ',';
 }
 
-// A record of a writer, without its end, with how long it took.
+// Returns a writer's record without its end, with the time that the job took.
 std::string Timed(std::string record, double seconds)
 {
     record.resize(std::min(record.size(), record.rfind('}')));
@@ -110,7 +115,7 @@ bool CFileRun::Open()
 {
     if (options_.resume && !OpenState())
         return false;
-    if (!options_.dryRun && !OpenReport()) // last, because it empties what was there
+    if (!options_.dryRun && !OpenReport()) // last, because it empties the existing report
         return false;
     if (!options_.dryRun)
         SweepLeftovers();
@@ -142,7 +147,7 @@ std::optional<CReport> CFileRun::WhyNotReport() const
         return ShellFailure(path, "in-use",
                             "the run reads or writes this file; choose another file for the report");
     if (options_.resume && CReportFile::IsReport(path))
-        return std::nullopt; // it says again what the first one said
+        return std::nullopt; // a further message would repeat the first one
     return WhyNotWrite(options_, path);
 }
 
@@ -153,7 +158,7 @@ bool CFileRun::OpenState()
     key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(options_, ~(kHowToRun | kProfile)));
     for (const char* file : {"base.htr", "KsBone.bsm"})
         key.AddFile(platform.DataFolder() + file);
-    if (!AddProfiles(key)) // by what is in them, and not by a name
+    if (!AddProfiles(key)) // by content, not by name
         return false;
     m_kCommonKey = key.Digits();
     m_kResume.Read(m_kState.folder);
@@ -164,7 +169,7 @@ bool CFileRun::OpenState()
     return false;
 }
 
-// A run that was killed had no time to.
+// Deletes files that killed runs could not delete.
 void CFileRun::SweepLeftovers() const
 {
     std::set<std::string> folders;
@@ -190,7 +195,7 @@ EExit CFileRun::Finish(bool ran, int requests)
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
 }
 
-// Before anything says that the run is done. A run of one file has synced it already.
+// Before anything reports the run as done. A run of one file has already synced it.
 bool CFileRun::SyncResults()
 {
     if (options_.resume && m_kResume.HasUnsynced())
@@ -207,7 +212,7 @@ bool CFileRun::SyncResults()
     return isSynced;
 }
 
-// In a worker.
+// Called in a worker.
 
 uint8_t CFileRun::Run(size_t index, std::FILE* record)
 {
@@ -229,7 +234,7 @@ CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t i
     FileEnd end{.endsRun = !options.keepGoing};
     try
     {
-        if (FolderExists(m_kJobs[index].source)) // in a tree, what cannot be listed stands for its files
+        if (FolderExists(m_kJobs[index].source)) // an unlistable folder
             TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
         else
             end = Convert(options, index, text.File());
@@ -296,13 +301,13 @@ std::string CFileRun::KeyOf(const ConversionJob& job) const
     return CContentHash().AddText(m_kCommonKey).AddText(NameInState(job)).AddFile(job.source).Digits();
 }
 
-// The same from wherever the run is started.
+// Returns a name that does not depend on the current folder.
 std::string CFileRun::NameInState(const ConversionJob& job) const
 {
     return job.output.starts_with(m_kState.folder) ? job.output.substr(m_kState.folder.size()) : job.output;
 }
 
-// In the program.
+// Called in the program.
 
 void CFileRun::Lost(size_t index)
 {

@@ -18,16 +18,15 @@ namespace gw {
 class CContentHash;
 struct CReport;
 
-/// Where a run keeps what the next one is to know.
+/// Where a run keeps its state for the next run.
 struct RunState
 {
-    std::string folder;       ///< with its separator at the end, or empty for the present one
-    std::string name = "run"; ///< of several runs into one folder each has its own
+    std::string folder;       ///< with trailing separator, or empty for the current folder
+    std::string name = "run"; ///< distinguishes several runs into one folder
 };
 
-/// Many conversions by worker processes. What is told of them and written about them comes in the order of
-/// the sources, whichever was done first. What a file is converted to, and when a failure ends the run, is
-/// for the classes below to say.
+/// Converts many files in worker processes. Messages and records appear in source order, whatever finishes
+/// first. Derived classes define how a file is converted, and when a failure ends the run.
 class CFileRun : public CJobHandler
 {
 public:
@@ -37,7 +36,7 @@ public:
     CFileRun(const ShellOptions& options, Jobs jobs, RunState state);
     ~CFileRun() override;
 
-    /// Converts all. Says why where it cannot begin, and what is left.
+    /// Converts everything. Prints why it cannot start, or what is left.
     EExit RunAll();
     const RunTally& Tally() const { return m_kTally; }
 
@@ -48,27 +47,27 @@ public:
     void Tick(size_t ended) final;
 
 protected:
-    /// How a conversion ended, in a worker; goes to the program as a number.
+    /// How a conversion ended, in a worker; sent to the program as a number.
     struct FileEnd
     {
         EConversion outcome = EConversion::Failed;
-        bool endsRun = false;  ///< as the rules of the command say
-        bool abandons = false; ///< and it goes without closing words
+        bool endsRun = false;  ///< by the rules of the command
+        bool abandons = false; ///< ends the run without a summary
     };
 
-    /// Converts one source, in a worker.
+    /// Converts one source. Called in a worker.
     virtual FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) = 0;
-    /// Tells a failure that the conversion could not tell itself. In a worker, or in the program.
+    /// Reports a failure that the conversion could not report itself. Called in a worker or in the program.
     virtual void TellLost(size_t index, const CReport& reason, std::FILE* record) = 0;
-    /// Tells that an output stands as an earlier run made it. In a worker.
+    /// Reports that an output from an earlier run is up to date. Called in a worker.
     virtual void TellUpToDate(size_t index) = 0;
-    /// What a conversion hands to the program beside its record. In a worker, behind Convert.
+    /// Returns data for the program in addition to the record. Called in a worker after Convert.
     virtual std::string Enclosure() { return {}; }
-    /// What was written about a source in its record, in order, and what was enclosed with it.
+    /// Handles the record of a source and the data enclosed with it, in source order.
     virtual void TakeRecord(size_t, EConversion, std::string_view, std::string_view) {}
-    /// Adds to the key of all results the profiles that they may be made by. False, and says why, for none.
+    /// Adds the possible profiles to the key of all results. If there are none, prints why and returns false.
     virtual bool AddProfiles(CContentHash& key) = 0;
-    /// Closing words. Whether all was well.
+    /// Prints the summary. Returns whether everything succeeded.
     virtual bool TellEnd() = 0;
 
     const ShellOptions& Options() const { return options_; }
@@ -96,9 +95,9 @@ private:
     Jobs m_kJobs;
     RunState m_kState;
     CResumeState m_kResume;
-    std::string m_kCommonKey;     ///< of everything but the source
-    std::string m_kReadyDigits;   ///< of the job's result, in a worker
-    std::string m_kReadyModified; ///< and when it was written
+    std::string m_kCommonKey;     ///< for everything but the source
+    std::string m_kReadyDigits;   ///< hash of the job's result, in a worker
+    std::string m_kReadyModified; ///< and its modification time
     CReportFile m_kReport;
     CDeferredSync m_kSync;
     CProgressBar m_kBar;

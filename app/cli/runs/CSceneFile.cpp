@@ -1,3 +1,6 @@
+// Reads any supported file and offers it as roots, nodes and a clock. The extension is tried first; a file
+// with an unknown one is tested for a container header.
+
 #include "CSceneFile.h"
 
 #include "CKeyframeControl.h"
@@ -29,7 +32,7 @@ bool CSceneFile::Load(const std::string& path)
     if (!m_bContainer && (m_kMotion.Load(path) || Failure().reason != EFailure::UnknownFormat))
         return !Failure();
     const bool isContainer = m_kScene.LoadFile(path, false);
-    // What cannot be opened at all is not of an unknown kind.
+    // A file that cannot be opened is not of an unknown kind.
     m_bContainer = m_bContainer || isContainer || IsUnreachable(m_kScene.Record().Failure().reason);
     return isContainer;
 }
@@ -53,7 +56,7 @@ std::vector<CObject*> CSceneFile::Roots() const
     return roots;
 }
 
-// Not by FindObjects: in a scene with shared nodes that would tell a node once per place.
+// Not with FindObjects, which would list a shared node once per place.
 std::vector<FoundNode> CSceneFile::Nodes() const
 {
     std::vector<FoundNode> found;
@@ -81,7 +84,7 @@ std::vector<FoundNode> CSceneFile::Nodes() const
     return found;
 }
 
-// The save list has every object once, in the order in which FindObject would meet it.
+// The save list contains every object once, in FindObject's order.
 const CKeyframeControl* CSceneFile::FirstTrack()
 {
     const std::vector<CObject*> objects = Objects();
@@ -107,8 +110,8 @@ float CSceneFile::TimeOf(int64_t frame)
     return track ? static_cast<float>(frame) / track->m_fFrequency : 0.0f;
 }
 
-// A root may hang in others. Their bounds follow once behind all instead of behind every root: a chain of
-// thousands of roots, each in the one before, would never end with every one measuring all above it.
+// A root can be below other roots. Their bounds are updated once at the end instead of after every root: in a
+// chain of thousands of roots, updating all ancestors each time would take forever.
 void CSceneFile::Update(float time)
 {
     std::unordered_set<CSpatial*> above;

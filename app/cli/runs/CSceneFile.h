@@ -12,7 +12,7 @@ namespace gw {
 
 class CKeyframeControl;
 
-/// A node as a walk finds it, with the node above it or null.
+/// A node found by a walk, and its parent or null.
 struct FoundNode
 {
     CNode* node;
@@ -20,15 +20,16 @@ struct FoundNode
     size_t depth;
 };
 
-/// Any file that the program can read, a motion or a container, as one thing: roots, nodes and a clock.
+/// Any file that the program can read, motion or container, as one thing: roots, nodes and a clock.
 class CSceneFile
 {
 public:
-    /// Reads a file by its extension, else by its beginning. False, with the reason in Failure(), when
-    /// nothing of it can be used. A damaged container is true as far as it could be read: see IsDamaged.
+    /// Reads a file by its extension, otherwise by its first bytes. Returns false, with the reason in
+    /// Failure(), if nothing in it is usable. Returns true for a damaged container, read as far as possible:
+    /// see IsDamaged.
     bool Load(const std::string& path);
 
-    /// The same for those who need all of it. Says what is wrong.
+    /// Same for commands that need the whole file. Prints what is wrong.
     bool LoadWhole(const std::string& path);
 
     bool IsContainer() const { return m_bContainer; }
@@ -39,17 +40,17 @@ public:
     const CMotionFile& Motion() const { return m_kMotion; }
     COrrinStream& Scene() { return m_kScene; }
 
-    /// All nodes that hang under the roots, depth first, each at the first of its places.
+    /// Returns all nodes below the roots, depth first, each at its first place.
     std::vector<FoundNode> Nodes() const;
-    /// The first track, whose clock counts for the whole file; null where there is none.
+    /// Returns the first track, whose clock is used for the whole file, or null.
     const CKeyframeControl* FirstTrack();
-    /// The time at which the first track reaches a frame.
+    /// Returns the time at which the first track reaches a frame.
     float TimeOf(int64_t frame);
-    /// Brings one root after the other to a time.
+    /// Updates all roots to a time, in order.
     void Update(float time);
-    /// The roots of a container, in their order, or the root of a motion.
+    /// Returns the roots of a container, in order, or the root of a motion.
     std::vector<CObject*> Roots() const;
-    /// All objects that the roots hold, in save order.
+    /// Returns all objects that the roots hold, in save order.
     std::vector<CObject*> Objects();
 
 private:

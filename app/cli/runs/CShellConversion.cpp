@@ -1,3 +1,7 @@
+// Chooses the bone map of a conversion. A named one is used as it is. Without a name, a stock map is used if
+// all its rows match the source, as the program has always done; otherwise the best of all installed maps,
+// unless its joints contradict it: then the user must name it.
+
 #include "CShellConversion.h"
 
 #include "CShellReports.h"
@@ -21,7 +25,7 @@ namespace gw {
 
 namespace {
 
-// The stock profiles of old, the one that is asked first.
+// The original stock profiles, in the order in which they are tried.
 constexpr const char* kLongKnown[] = {"PoserBVH.prf", "MaxBVH.prf"};
 
 std::vector<std::string> NamesOf(const std::vector<InstalledProfile>& profiles)
@@ -60,7 +64,7 @@ bool CShellConversion::Open(const std::string& path)
     return !reports_.HasFailed();
 }
 
-// The first stock profile that fits.
+// Selects the first stock profile that fits.
 void CShellConversion::PickStockProfile()
 {
     const CBoneNames sources(SourceRoot());
@@ -97,7 +101,7 @@ const std::vector<InstalledProfile>& CShellConversion::InstalledProfiles()
     return *installed_;
 }
 
-// Each name once, with the first profile of that name.
+// Keeps the first profile of each name.
 void CShellConversion::ReadInstalled(const std::string& folder, bool stock)
 {
     std::unordered_set<std::string> names;
@@ -147,7 +151,7 @@ std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
         if (profile.text)
             profiles.push_back({profile.path, *profile.text});
     }
-    // Where nothing fits at all, what is told of is a profile that animators know.
+    // If nothing fits at all, report a profile that animators know.
     const auto rank =
         [known = std::array{DataFile(kLongKnown[0]), DataFile(kLongKnown[1])}](const LoadedProfile& profile) {
             return std::ranges::find(known, profile.path) - known.begin();
@@ -173,7 +177,7 @@ bool CShellConversion::SelectFitting()
     return false;
 }
 
-// A stock profile has always been taken where its rows fit: what speaks against it is a warning.
+// A stock profile has always been used if its rows fit, so doubts about it are only warnings.
 void CShellConversion::WarnOfStockPick() const
 {
     const std::string path[] = {ProfilePath()};

@@ -21,38 +21,38 @@ struct InstalledProfile
 {
     std::string name;
     std::string path;
-    bool stock = false;                   ///< installed with the program, not one of the user's own
-    std::optional<std::string_view> text; ///< empty if it cannot be read; valid as long as the conversion
+    bool stock = false;                   ///< installed with the program, not the user's own
+    std::optional<std::string_view> text; ///< no value if it cannot be read; valid as long as the conversion
 };
 
-/// The conversion as the shell drives it: with a choice of its profile. Which profiles are installed is
-/// looked up when it is first asked for, and stands from then on.
+/// The conversion as used by the shell, including the choice of the profile. The installed profiles are
+/// listed when they are first needed and then kept.
 class CShellConversion : public CFileConversion
 {
 public:
     /// Options and reports must outlive the conversion.
     CShellConversion(const ShellOptions& options, const ConversionChoices& choices, CShellReports& reports);
 
-    /// Opens a source and loads the target. Where no profile was named takes a stock profile that fits the
-    /// source. False, with the reason said, where anything failed.
+    /// Opens a source and loads the target. If no profile was named, selects a stock profile that fits.
+    /// Returns false, after reporting the reason, if anything failed.
     bool Open(const std::string& path);
-    /// The installed profiles, each name once and with the file that it stands for.
+    /// Returns the installed profiles, each name once, with its file.
     const std::vector<InstalledProfile>& InstalledProfiles();
-    /// The file of a profile that is named by its path, which ends in .prf, or by its display name, or by any
-    /// other path. Empty, and says why, for none that can be read.
+    /// Returns the file of a profile given by its path ending in .prf, by its display name, or by any other
+    /// path. Empty, after printing why, if none can be read.
     std::string ResolveProfile(const std::string& nameOrFile);
-    /// Selects the profile that the options name, or the first of the choices. False, with the reason said,
-    /// where it cannot be read, where no profile fits the source, and where the first one is doubtful.
+    /// Selects the profile named in the options, or the best choice. Returns false, after reporting the
+    /// reason, if it cannot be read, if no profile fits the source, and if the best one is doubtful.
     bool SelectProfile();
-    /// The installed profiles, the best one for the open source first: the stock profile that was chosen when
-    /// it was opened, then by ChooseProfile.
+    /// Returns the installed profiles, best first for the open source: the stock profile that was selected at
+    /// open, then by ChooseProfile.
     std::vector<ProfileChoice> Choices(EJudged judged = EJudged::All);
-    /// What was chosen; nothing for a profile that was named or is the stock one of old.
+    /// Returns the choice; nothing for a named profile or an original stock profile.
     const std::optional<ProfileChoice>& Chosen() const { return chosen_; }
     bool IsAdapted() const { return chosen_ && chosen_->adapted; }
-    /// How far the nearest profile fits, where none did.
+    /// Returns how well the closest profile fits, if none did.
     const std::optional<CProfileFit>& Nearest() const { return nearest_; }
-    /// How a profile fits the open source. False when its file cannot be read.
+    /// Measures how a profile fits the open source. Returns false if its file cannot be read.
     bool Measure(const std::string& profilePath, CProfileFit& fit) const;
 
 private:
@@ -66,7 +66,7 @@ private:
     const ShellOptions& options_;
     const CShellReports& reports_;
     std::deque<CProfileTexts> m_kTexts;                      ///< of the folders of installed profiles
-    std::optional<std::vector<InstalledProfile>> installed_; ///< once asked for
+    std::optional<std::vector<InstalledProfile>> installed_; ///< set when first needed
     std::optional<ProfileChoice> chosen_;
     std::optional<CProfileFit> nearest_;
 };

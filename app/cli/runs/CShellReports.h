@@ -9,8 +9,8 @@ namespace gw {
 
 struct ShellOptions;
 
-/// What a conversion reports: said on standard error as it comes, and kept, but for the program's fixed
-/// messages, which programs need not be told.
+/// The reports of a conversion: printed to standard error immediately and kept, except for the program's
+/// fixed messages, which other programs do not need.
 class CShellReports
 {
 public:
@@ -25,9 +25,9 @@ public:
         reports_.push_back(report);
         hasFailed_ = hasFailed_ || !report.warning;
     }
-    /// Whether anything was reported that is no warning.
+    /// Returns whether anything other than warnings was reported.
     bool HasFailed() const { return hasFailed_; }
-    /// Everything that was reported, in order.
+    /// Returns all reports, in order.
     const std::vector<CReport>& All() const { return reports_; }
 
 private:

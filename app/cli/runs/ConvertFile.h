@@ -12,7 +12,7 @@ namespace gw {
 class CPagePart;
 struct CReport;
 
-/// One source and the file that becomes of it.
+/// A source and its output file.
 struct ConversionJob
 {
     std::string source;
@@ -22,12 +22,12 @@ struct ConversionJob
 enum class EConversion : uint8_t
 {
     Converted,
-    Planned, ///< with --dry-run: it would be converted
-    Skipped, ///< the output is there, with --skip-existing
+    Planned, ///< with --dry-run: would be converted
+    Skipped, ///< the output exists, with --skip-existing
     Failed,
 };
 
-/// "converted", "failed", ...
+/// Returns "converted", "failed", ...
 const char* OutcomeName(EConversion outcome);
 
 /// What the process does after a conversion.
@@ -37,17 +37,17 @@ enum class EProcess : uint8_t
     Ends, ///< its motions need not be freed
 };
 
-/// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Tells the result
-/// on standard output and everything else on standard error. Nothing of one source stays for the next. A
-/// record, unless it is null, takes what --json tells and the key figures, and a part of a page the
-/// conversion's pictures and figures.
+/// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Prints the result
+/// to standard output and everything else to standard error. Keeps nothing for the next source. `record`,
+/// unless null, receives the --json output and the key figures; a page part receives the conversion's
+/// pictures and figures.
 EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process = EProcess::GoesOn);
 
-/// Tells in the same way of a conversion that came to nothing, for a reason that it could not tell itself.
+/// Reports in the same way a conversion that failed for a reason it could not report itself.
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const CReport& reason,
                 std::FILE* record);
-/// And of one that is not made.
+/// Reports in the same way a conversion that is skipped.
 void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why);
 
 } // namespace gw

@@ -10,9 +10,9 @@ namespace gw {
 
 namespace {
 
-using Json = nlohmann::json; // for single values: nothing here builds a tree
+using Json = nlohmann::json; // only for single values, never for trees
 
-// What a member of the record can be. The size of a picture is nothing that a conversion asks for.
+// The types of the record's members. A picture's size is never part of a conversion.
 template <class T>
 concept Plain = std::same_as<T, bool> || std::same_as<T, std::string> || std::same_as<T, float> ||
     std::same_as<T, int64_t>;

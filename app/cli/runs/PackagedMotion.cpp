@@ -22,7 +22,7 @@ bool SayNoTemporary(const std::string& folder)
     return false;
 }
 
-// Streams read files, so the bytes inside a package have to become one for a moment. Says why it fails.
+// Streams read files, so the bytes inside a package are written to a temporary one. Prints why it fails.
 bool LoadBytes(const std::string& path, std::span<const std::byte> bytes, const char* extension,
                CMotionFile& motion)
 {

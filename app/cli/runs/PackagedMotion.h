@@ -7,11 +7,11 @@ namespace gw {
 class CMotionFile;
 class COrrinStream;
 
-/// Reads a container that must be whole. Says what is wrong with any other.
+/// Reads a container, which must be complete. Prints what is wrong with it.
 bool LoadWhole(COrrinStream& scene, const std::string& path);
-/// Reads the motion inside a Kinetra file. Says why it cannot.
+/// Reads the motion inside a Kinetra file. Prints why it fails.
 bool LoadPackagedMotion(const std::string& path, CMotionFile& motion);
-/// The same out of a container that is read already.
+/// Same for a container that is already loaded.
 bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMotionFile& motion);
 
 } // namespace gw

@@ -4,10 +4,10 @@
 
 namespace gw {
 
-/// Reads a plan that this version of the program made. Says why it cannot.
+/// Reads a plan written by this version of the program. Prints why it fails.
 bool LoadPlan(const std::string& path, CRunPlan& plan);
 
-/// Where the report of a shard goes unless told: beside the plan.
+/// Returns the default report file of a shard, next to the plan.
 std::string ShardReport(const std::string& planPath, size_t shard);
 
 } // namespace gw

@@ -8,10 +8,10 @@ class CJsonWriter;
 struct CProfileFit;
 struct CReport;
 
-/// Why a source is converted by no installed profile, with the one that comes nearest; without rows none is
-/// installed.
+/// Returns the report that no installed profile fits a source, with the closest one; `nearest` without rows
+/// means that none is installed.
 CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest);
-/// The same as members of a JSON object.
+/// Writes the same as members of a JSON object.
 void WriteFit(CJsonWriter& json, const CProfileFit& fit);
 
 } // namespace gw

@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-// Most records end like this, as WriteReports writes it, and need not be parsed.
+// Most records end like this, as WriteReports writes them, and need not be parsed.
 constexpr std::string_view kNoReports = R"("failures":[],"warnings":[])";
 
 void WriteReport(CJsonWriter& json, const CReport& report)
@@ -40,7 +40,7 @@ CReport ReadReport(std::string_view text, bool warning)
     return report;
 }
 
-// The elements of a member that is an array.
+// Returns the elements of an array member.
 std::vector<CJsonMembers::Member> ReadList(const CJsonMembers& json, std::string_view key)
 {
     CJsonMembers list;

@@ -12,14 +12,13 @@ class CFailureRecord;
 class CJsonWriter;
 struct CReport;
 
-/// Reports as the members "failures" and "warnings".
+/// Writes reports as the members "failures" and "warnings".
 void WriteReports(CJsonWriter& json, const std::vector<CReport>& reports);
-/// What a reader kept, as the same members.
+/// Writes a reader's failures and warnings as the same members.
 void WriteRecord(CJsonWriter& json, const std::string& path, const CFailureRecord& record);
-/// Takes the reports back out of an object with those members, behind what is there already. False where the
-/// text is no JSON object.
+/// Appends the reports of an object with those members. Returns false if the text is not a JSON object.
 bool ReadReports(std::string_view text, std::vector<CReport>& reports);
-/// Takes the output and the outcome from a line of a run's report. NotJson for any other line.
+/// Reads the output and the outcome from a line of a run's report. Returns NotJson for any other line.
 EJsonFault ReadReportLine(std::string_view text, std::string& output, std::string& outcome);
 
 } // namespace gw

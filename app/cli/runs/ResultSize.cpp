@@ -16,15 +16,15 @@ namespace gw {
 
 namespace {
 
-// Seven numbers of at least eight characters ("0.000000"), each behind a separator, and a line end.
+// Seven numbers of at least eight characters ("0.000000"), each after a separator, and a line end.
 constexpr double kLeastRowBytes = 7 * 9 + 1;
 
-// The characters of the row numbers from 1 to a count.
+// Returns the total length of the row numbers from 1 to a count.
 double NumberBytes(double rowCount)
 {
     double bytes = 0.0;
     for (double first = 1.0; first <= rowCount; first *= 10.0)
-        bytes += rowCount - first + 1.0; // all rows from here have one digit more
+        bytes += rowCount - first + 1.0; // all rows from here on have one more digit
     return bytes;
 }
 

@@ -9,8 +9,8 @@ namespace gw {
 class CFileConversion;
 struct ConversionJob;
 
-/// Why the result of a conversion cannot fit into its file, found before any work is done: a .Kinetra holds
-/// less than 2 GiB. Nothing for a result that may fit; the file itself counts then.
+/// Returns why the result of a conversion cannot fit into its file, before any work is done: a .Kinetra holds
+/// less than 2 GiB. Nothing if it may fit; the writer checks the actual size.
 std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job);
 
 } // namespace gw

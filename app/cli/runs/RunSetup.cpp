@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-constexpr int64_t kWorkerLimit = 1024; // far above the cores of any machine, far below what a system lets run
+constexpr int64_t kWorkerLimit = 1024; // far above the cores of any machine, far below the system's limit
 
 } // namespace
 

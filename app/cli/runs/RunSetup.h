@@ -4,13 +4,13 @@
 
 namespace gw {
 
-/// Whether the options of a run over many files go together. Says why not.
+/// Returns whether the options of a run over many files can be combined; prints an error if not.
 bool IsRunPossible(const ShellOptions& options);
-/// Whether no two jobs write the same file. Says which do.
+/// Returns whether all jobs write different files; prints those that do not.
 bool AreOutputsApart(const CFileRun::Jobs& jobs);
-/// Makes the output folder, if there is to be one. Says why it cannot.
+/// Creates the output folder, if one is given. Prints why it fails.
 bool MakeOutputFolder(const ShellOptions& options);
-/// Where --resume keeps what was done: in the output folder, else in the folder of the sources.
+/// Returns where --resume keeps its state: in the output folder, otherwise in the folder of the sources.
 RunState StateOf(const ShellOptions& options);
 
 } // namespace gw

@@ -8,17 +8,17 @@
 
 namespace gw {
 
-/// How many sources of a run came to each end.
+/// The number of sources by outcome.
 struct RunTally
 {
-    std::array<size_t, 4> ended{}; ///< by EConversion
-    size_t left = 0;               ///< that the run did not come to
+    std::array<size_t, 4> ended{}; ///< indexed by EConversion
+    size_t left = 0;               ///< not processed by the run
 
     size_t& operator[](EConversion outcome) { return ended[static_cast<size_t>(outcome)]; }
     size_t operator[](EConversion outcome) const { return ended[static_cast<size_t>(outcome)]; }
 };
 
-/// The closing words of a run: one line, or one object with --json.
+/// Prints the summary of a run: one line, or one object with --json.
 void TellTally(const ShellOptions& options, const RunTally& tally);
 
 } // namespace gw

@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// What is in a path beside the way down, such as "..", has no place below an output folder.
+// Parts such as ".." have no equivalent below an output folder.
 std::vector<std::string> Steps(const std::string& path)
 {
     std::vector<std::string> steps;
@@ -64,7 +64,7 @@ bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
     return true;
 }
 
-// A folder that could not be read stands for the sources in it: converting it fails and says so.
+// A folder that cannot be read is listed in place of its sources: converting it fails with a message.
 void AddFolder(const std::string& folder, const std::string& below, const ShellOptions& options,
                std::span<const std::string_view> extensions, std::vector<RunSource>& sources)
 {

@@ -9,20 +9,20 @@
 
 namespace gw {
 
-/// A source, and where it lies in what was named: its result lies there below the output folder.
+/// A source and its relative position, which its result keeps below the output folder.
 struct RunSource
 {
     std::string path;
-    std::string below; ///< "run/walk.bvh"; of a file that was named by itself its name
+    std::string below; ///< "run/walk.bvh"; for a file that was named directly, its name
 };
 
-/// The sources that a command line names: files as they are, folders with all sources below them, and the
-/// same for the lines of --files-from, which lie below the folder that they have in common. False, and says
-/// why, when the list cannot be read.
+/// Lists the sources named on a command line: files as they are, folders with all sources below them. The
+/// same for the lines of --files-from, whose positions are relative to their common folder. If the list
+/// cannot be read, prints why and returns false.
 bool ListSources(const ShellOptions& options, std::span<const std::string_view> extensions,
                  std::vector<RunSource>& sources);
 
-/// The path of a source's result: below an output folder, or beside the source where there is none.
+/// Returns the path of a source's result: below an output folder, or next to the source if `folder` is empty.
 std::string OutputOf(const std::string& folder, const RunSource& source, std::string_view extension);
 
 } // namespace gw

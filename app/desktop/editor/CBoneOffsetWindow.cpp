@@ -17,7 +17,7 @@ namespace gw {
 
 namespace {
 
-// The rows are named as the columns of the list.
+// Rows have the names of the list's columns.
 QLabel* MakeLabel(const CGaitConvertContent& content, int column, QWidget* buddy)
 {
     auto* const label = new QLabel(ToQString(content.Message(kMapColumnTitles[column].messageId)));
@@ -120,7 +120,7 @@ QLayout* CBoneOffsetWindow::MakeButtons()
     return row;
 }
 
-// The Enter key takes OK while a field is still being edited.
+// Enter presses OK even while a field is being edited.
 void CBoneOffsetWindow::accept()
 {
     for (int axis = 0; axis < kAxisCount; ++axis)
@@ -128,7 +128,7 @@ void CBoneOffsetWindow::accept()
     QDialog::accept();
 }
 
-// Shows this field alone: another one may hold what is still to be read.
+// Updates only this field: another one may contain input that is not read yet.
 void CBoneOffsetWindow::LeaveRotation(int axis)
 {
     CFieldEdit* const field = m_pkRotation[static_cast<size_t>(axis)];

@@ -11,11 +11,11 @@ class CBoneOffsetDialog;
 class CFieldEdit;
 class CGaitConvertContent;
 
-/// The window of the dialog that edits rotation and axes of one row.
+/// The dialog window for the rotation and axes of one row.
 class CBoneOffsetWindow : public QDialog
 {
 public:
-    /// The content names the fields. The dialog holds the numbers and must outlive the window.
+    /// `content` provides the field names. `dialog` holds the numbers and must outlive the window.
     CBoneOffsetWindow(const CGaitConvertContent& content, CBoneOffsetDialog& dialog, QWidget* owner);
 
     void accept() override;

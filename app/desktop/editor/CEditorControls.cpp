@@ -34,7 +34,7 @@ constexpr ButtonRow kButtonRows[] = {
     {kSaveProfileButton, "Save Profile", &ProfileButtons::saveProfile},
 };
 
-// Controls that the window has and never shows. The offset that a file gives goes through the fields.
+// Controls that the window has but never shows. A file's offset is entered through the fields.
 constexpr ButtonRow kUnusedButtons[] = {
     {3, "Auto-Mapping", nullptr},
     {4, "Auto-Offset",  nullptr},
@@ -177,7 +177,7 @@ QPushButton* CEditorControls::MakeButton(int id)
     const ButtonRow& row = *std::ranges::find(kButtonRows, id, &ButtonRow::id);
     auto* const button = new QPushButton(Translated(row.text), m_pkWindow);
     button->setObjectName(Name(id));
-    button->setAutoDefault(false); // the Enter key is the fields'
+    button->setAutoDefault(false); // Enter belongs to the fields
     m_kButtons.push_back({id, row.enabled, button});
     return button;
 }
@@ -206,7 +206,7 @@ QLabel* CEditorControls::MakeHint(const QString& text, const QString& name)
 {
     auto* const hint = new QLabel(text, m_pkWindow);
     hint->setObjectName(name);
-    hint->setProperty("kind", QStringLiteral("caption")); // the style says it quietly
+    hint->setProperty("kind", QStringLiteral("caption")); // the style sheet makes it unobtrusive
     return hint;
 }
 

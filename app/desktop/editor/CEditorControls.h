@@ -17,8 +17,8 @@ class CGaitConvertContent;
 class CMapRowView;
 struct ProfileButtons;
 
-/// The children of the editor's window, laid out; what they do is the window's business. They are made from
-/// top to bottom, which is the order of the Tab key. Names of objects are control ids.
+/// The controls of the editor's window and their layout; the window handles their events. They are created
+/// from top to bottom, which is the Tab order. Object names are control ids.
 class CEditorControls
 {
 public:
@@ -34,16 +34,16 @@ public:
         QPushButton* button;
     };
 
-    /// Fills a window that has no layout yet; it owns what is made. The content names the columns.
+    /// Fills a window that has no layout yet and owns the controls. `content` provides the column names.
     CEditorControls(const CGaitConvertContent& content, QWidget* window);
 
     std::vector<Field> m_kFields;
     std::vector<Button> m_kButtons;
-    QWidget* m_pkFilterLine = nullptr; ///< hidden until somebody looks for a bone
+    QWidget* m_pkFilterLine = nullptr; ///< hidden until the user filters bones
     CFieldEdit* m_pkFilter = nullptr;
     CBoneTreeView* m_pkSourceTree = nullptr;
     CBoneTreeView* m_pkTargetTree = nullptr;
-    CElidedLabel* m_pkPair = nullptr; ///< what Add to Map would map
+    CElidedLabel* m_pkPair = nullptr; ///< the pair that Add to Map would add
     CMapRowView* m_pkRows = nullptr;
 
 private:
@@ -57,7 +57,7 @@ private:
     void MakeUnusedControls();
     CFieldEdit* MakeField(int id, const QString& name);
     QPushButton* MakeButton(int id);
-    /// A list under its name, with a hint on the right of it or null.
+    /// A list under its title, with an optional hint to the right.
     QLayout* Titled(QWidget* widget, QLabel* hint);
     QLabel* MakeLabel(const QString& text, QWidget* buddy);
     QLabel* MakeHint(const QString& text, const QString& name);

@@ -4,7 +4,8 @@ namespace gw {
 
 CElidedLabel::CElidedLabel(QWidget* parent) : QLabel(parent)
 {
-    setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred); // else a long text would widen the window
+    // otherwise a long text would widen the window
+    setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Preferred);
 }
 
 void CElidedLabel::ShowText(const QString& text)

@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A label of one line that takes the room there is. A longer text is shortened in its middle, and stands
-/// whole in the tool tip.
+/// A single-line label that uses the available width. A longer text is elided in the middle and shown in full
+/// in the tool tip.
 class CElidedLabel : public QLabel
 {
 public:

@@ -36,7 +36,7 @@ void CFieldEdit::focusOutEvent(QFocusEvent* event)
     QLineEdit::focusOutEvent(event);
     if (event->reason() == Qt::PopupFocusReason)
         return;
-    setText(text()); // what was left is no typing any more that the undo keys could take back
+    setText(text()); // clears the undo history
     if (onLeave_)
         onLeave_();
 }

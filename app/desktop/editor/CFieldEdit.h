@@ -5,19 +5,18 @@
 
 namespace gw {
 
-/// A text field that tells when the keyboard leaves it. The undo keys are its own only while there is typing
-/// to take back; else they are the window's.
+/// A text field that reports when it loses the keyboard. It handles the undo keys only while there is typing
+/// to undo; otherwise they are the window's.
 class CFieldEdit : public QLineEdit
 {
 public:
     using QLineEdit::QLineEdit;
 
-    /// Called when the focus goes elsewhere, be it in another window; a menu over the field takes nothing
-    /// away.
+    /// Called when the focus moves elsewhere, even to another window, but not to a menu over the field.
     void SetOnLeave(std::function<void()> onLeave) { onLeave_ = std::move(onLeave); }
-    /// Called at the Escape key, which then goes no further. Without it the key is the window's.
+    /// Called for the Escape key, which is then not passed on. If not set, the window handles the key.
     void SetOnEscape(std::function<void()> onEscape) { onEscape_ = std::move(onEscape); }
-    /// Shows a text, and leaves typing and caret alone where it is there already.
+    /// Shows a text. Does not touch typing or the caret if it is already shown.
     void ShowText(const QString& text);
 
 protected:

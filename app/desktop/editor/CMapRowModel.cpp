@@ -38,8 +38,8 @@ CMapRowModel::CMapRowModel(QStringList titles, QObject* parent)
 {
 }
 
-// Between the rows that are the same at the top and at the bottom, rows change their texts as far as there
-// are old ones, and the rest comes or goes.
+// Between the rows that are equal at the top and at the bottom, existing rows change their texts, and the
+// difference is inserted or removed.
 void CMapRowModel::ShowRows(const CMapRowTable& table)
 {
     std::vector<CMapRowTable::Row> rows = RowsOf(table);
@@ -89,7 +89,7 @@ QVariant CMapRowModel::data(const QModelIndex& index, int role) const
     {
     case Qt::DisplayRole:
         return Text(index);
-    case Qt::ToolTipRole: // long names are cut in the middle
+    case Qt::ToolTipRole: // long names are elided in the middle
         return index.column() < kRotationColumn ? Text(index) : QVariant();
     case Qt::TextAlignmentRole:
         return QVariant::fromValue(AlignmentOf(index.column()));

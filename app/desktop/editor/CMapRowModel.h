@@ -8,12 +8,12 @@
 
 namespace gw {
 
-/// The rows of a bone map as they were last shown. Takes over a changed table row by row, so that the rows
-/// around a change keep their place on the screen.
+/// The rows of a bone map as last shown. A changed table is applied row by row, so that rows around a change
+/// keep their place on the screen.
 class CMapRowModel : public QAbstractTableModel
 {
 public:
-    /// Titles for the columns of kMapColumnTitles.
+    /// `titles` belong to the columns of kMapColumnTitles.
     CMapRowModel(QStringList titles, QObject* parent);
 
     void ShowRows(const CMapRowTable& rows);

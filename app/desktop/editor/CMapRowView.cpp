@@ -35,7 +35,7 @@ CMapRowView::CMapRowView(const CGaitConvertContent& content, QWidget* parent)
     setShowGrid(false);
     setWordWrap(false);
     setTextElideMode(Qt::ElideMiddle);
-    // The columns are as wide as the table, and a little wider for the one that only fills.
+    // The columns fill the table; the last one may extend a little beyond it.
     setHorizontalScrollBarPolicy(Qt::ScrollBarAlwaysOff);
     horizontalHeader()->setSectionResizeMode(QHeaderView::Fixed);
     horizontalHeader()->setMinimumSectionSize(1);
@@ -88,7 +88,7 @@ void CMapRowView::selectionChanged(const QItemSelection& selected, const QItemSe
     TellSelection(selected, true);
 }
 
-// Whoever drags over rows and out of the list has clicked on the last of them.
+// Dragging over rows and out of the list counts as a click on the last of them.
 void CMapRowView::mouseReleaseEvent(QMouseEvent* event)
 {
     QTableView::mouseReleaseEvent(event);
@@ -105,7 +105,7 @@ void CMapRowView::mouseDoubleClickEvent(QMouseEvent* event)
         m_kCallbacks.doubleClick(row);
 }
 
-// A selection by keyboard is a click on the row that it ends on: a list that only the mouse can use is none.
+// Selecting by keyboard counts as a click on the last row; otherwise the list would need a mouse.
 void CMapRowView::keyPressEvent(QKeyEvent* event)
 {
     m_bSelectionChanged = false;

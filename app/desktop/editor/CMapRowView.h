@@ -9,22 +9,22 @@ class CGaitConvertContent;
 class CMapRowModel;
 class CMapRowTable;
 
-/// The editor's list of rows on the screen. Whole rows are selected, several at once.
+/// The editor's list of rows. Whole rows are selected, several at a time.
 class CMapRowView : public QTableView
 {
 public:
     struct Callbacks
     {
-        std::function<void(int row, bool selected)> select; ///< once for each row that changed
-        std::function<void(int row)> click;                 ///< after the selection; -1 for none
+        std::function<void(int row, bool selected)> select; ///< once per changed row
+        std::function<void(int row)> click;                 ///< after the selection; -1 for no row
         std::function<void(int row)> doubleClick;
     };
 
-    /// The content names the columns.
+    /// `content` provides the column names.
     CMapRowView(const CGaitConvertContent& content, QWidget* parent);
 
     void SetCallbacks(Callbacks callbacks) { m_kCallbacks = std::move(callbacks); }
-    /// Shows a table and its selection as they stand.
+    /// Shows a table and its selection.
     void ShowRows(const CMapRowTable& rows);
 
 protected:
@@ -40,8 +40,8 @@ private:
 
     CMapRowModel* m_pkModel;
     Callbacks m_kCallbacks;
-    bool m_bShowing = false;          ///< changes come from the table and not from the user
-    bool m_bSelectionChanged = false; ///< since a key went down
+    bool m_bShowing = false;          ///< changes come from the table, not the user
+    bool m_bSelectionChanged = false; ///< since a key was pressed
 };
 
 } // namespace gw

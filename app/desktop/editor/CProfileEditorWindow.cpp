@@ -22,7 +22,7 @@ namespace gw {
 namespace {
 
 constexpr const char* kPlaceSetting = "DialogPos";
-// The size that a stored place must have to be used again; a larger font makes the window larger.
+// A stored position is used only if its size is this; a larger font makes the window larger.
 constexpr QSize kTemplateSize(720, 640);
 
 } // namespace
@@ -40,7 +40,7 @@ CProfileEditorWindow::CProfileEditorWindow(CGaitConvertContent& content, CPlatfo
     m_kControls.m_pkSourceTree->setFocus();
 }
 
-// A window that goes while it is visible takes the focus from its fields, when nobody is left to hear of it.
+// A visible window that is destroyed takes the focus from its fields, when their listeners are already gone.
 CProfileEditorWindow::~CProfileEditorWindow()
 {
     for (const auto& [id, edit] : m_kControls.m_kFields)
@@ -97,7 +97,8 @@ CProfileEditorDialog& CProfileEditorWindow::Model() const
     return *content_.ProfileEditor();
 }
 
-// A message box takes the focus from the field that it was just given to, whose leaving says nothing new.
+// A message box takes the focus from the field that just received it; ignore that focus-out, it carries no
+// edit.
 void CProfileEditorWindow::LeaveField()
 {
     if (std::exchange(m_bLeavingField, true))
@@ -107,7 +108,7 @@ void CProfileEditorWindow::LeaveField()
     QTimer::singleShot(0, this, [this] { ReleaseButtons(); });
 }
 
-// A press on a button makes a field lose the focus. Where that shows a message box, the box gets the release,
+// Pressing a button makes a field lose the focus. If that shows a message box, the box gets the mouse release
 // and the button would stay down.
 void CProfileEditorWindow::ReleaseButtons()
 {
@@ -179,7 +180,7 @@ void CProfileEditorWindow::reject()
     Model().Close();
 }
 
-// The Enter key commits a field and stays in the window.
+// Enter commits a field without closing the window.
 void CProfileEditorWindow::keyPressEvent(QKeyEvent* event)
 {
     if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
@@ -194,7 +195,7 @@ bool CProfileEditorWindow::RunBoneOffset(CBoneOffsetDialog& dialog)
     return window.exec() == Accepted;
 }
 
-// The model tells of a change before it has worked out its buttons, and often several times in a row.
+// The model reports a change before it has updated its buttons, and often several times in a row.
 void CProfileEditorWindow::Refresh()
 {
     if (!isVisible() || std::exchange(m_bRedrawQueued, true))
@@ -229,7 +230,7 @@ void CProfileEditorWindow::ShowFieldsAndButtons()
         button.button->setEnabled(Model().Buttons().*button.enabled);
 }
 
-// The pair stays readable while a filter hides one of its bones.
+// Keeps the pair readable while the filter hides one of its bones.
 void CProfileEditorWindow::ShowPair()
 {
     const QString source = ToQString(Model().SourceTree().SelectedText());

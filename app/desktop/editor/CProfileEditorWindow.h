@@ -12,25 +12,25 @@ class CBoneOffsetDialog;
 class CPlatform;
 class CProfileEditorDialog;
 
-/// The window of the profile editor: shows what the model answers, forwards what the user does. Modeless; the
-/// main window's toggle shows and hides it.
+/// The window of the profile editor: shows the model's state and forwards user actions. Modeless; the main
+/// window's toggle shows and hides it.
 class CProfileEditorWindow : public QDialog
 {
 public:
-    /// Model, texts and questions are the content's; both it and the platform must outlive the window.
+    /// Model, texts and questions come from the content; it and the platform must outlive the window.
     CProfileEditorWindow(CGaitConvertContent& content, CPlatform& platform, QWidget* owner);
     ~CProfileEditorWindow() override;
 
-    /// Shows or hides the window as the model says. It is placed from the settings the first time, and later
-    /// comes back where it was hidden; hiding it stores its place.
+    /// Shows or hides the window. It is placed from the settings the first time and later returns to where it
+    /// was hidden; hiding stores its position.
     void SetShown(bool shown);
-    /// The model changed: shows its present state soon, all changes until then at once.
+    /// Schedules an update after the model has changed; several changes share one update.
     void Refresh();
-    /// Runs the dialog that edits one row, modal to this window if it is visible, else to the owner. True on
-    /// OK.
+    /// Runs the dialog that edits one row, modal to this window if it is visible, otherwise to the owner.
+    /// Returns true on OK.
     bool RunBoneOffset(CBoneOffsetDialog& dialog);
 
-    /// Escape, and the window's own close button: commits the field that is being edited and closes.
+    /// Handles Escape and the window's close button: commits the field being edited and closes.
     void reject() override;
 
 protected:
@@ -57,7 +57,8 @@ private:
     CGaitConvertContent& content_;
     CPlatform& platform_;
     CEditorControls m_kControls;
-    std::optional<QRect> hiddenAt_; ///< top left with the frame, size without; the window manager forgets it
+    /// top left with the frame, size without; the window manager does not remember it
+    std::optional<QRect> hiddenAt_;
     bool m_bPlaced = false;
     bool m_bRedrawQueued = false;
     bool m_bLeavingField = false;

@@ -1,3 +1,7 @@
+// The face creates its children from the skin, finds the ones that the program needs by name, and connects
+// them to the conversion. Operations block the event loop, so progress and status are painted directly while
+// one is running.
+
 #include "CContent.h"
 
 #include "CGLView.h"
@@ -22,7 +26,7 @@ namespace gw {
 
 namespace {
 
-constexpr int kProgressMilliseconds = 150; // what is over before this needs no progress
+constexpr int kProgressMilliseconds = 150; // shorter operations show no progress
 constexpr int kCornerSide = 32;            // pixels of the corner with the icon
 
 } // namespace
@@ -43,7 +47,7 @@ CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : Q
 
 CContent::~CContent() = default;
 
-// The child of a name, or null where it is of another kind or not there.
+// Returns the child with a name, or null if it is missing or of another type.
 template <class Widget>
 Widget* CContent::Child(std::string_view name) const
 {
@@ -118,7 +122,7 @@ void CContent::Report(const CReport& report)
     m_kReports.push_back(report);
 }
 
-// One line for each thing that was reported.
+// One line per report.
 std::string CContent::Notes() const
 {
     std::string text;
@@ -237,7 +241,7 @@ CCntComboExControl& CContent::CreateComboEx(std::string_view field, std::string_
     return m_kCombo;
 }
 
-// Ticks that come in the midst of an operation are lost, as if it had kept the program from its events.
+// Ticks during an operation are dropped, as if it had blocked the event loop.
 void CContent::SetTimer(int id, int milliseconds)
 {
     std::unique_ptr<QTimer>& timer = m_kTimers[id];

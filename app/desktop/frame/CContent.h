@@ -19,8 +19,8 @@ class CLeftKeys;
 class CProfileEditorWindow;
 class CSkin;
 
-/// The face of the main window: a skin's children. Clicks, drags and ticks go to the conversion behind it,
-/// which answers through the port that this is.
+/// The face of the main window: the children of a skin. It forwards clicks, drags and ticks to the
+/// conversion, which replies through the port that this class implements.
 class CContent : public QWidget, public CContentWindow
 {
 public:
@@ -28,19 +28,19 @@ public:
     CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame);
     ~CContent() override;
 
-    /// The conversion that commands go to; null as long as there is none.
+    /// Sets the conversion that receives commands; may be null.
     void SetLogic(CGaitConvertContent* logic) { m_pkLogic = logic; }
     void SetEditor(CProfileEditorWindow* editor) { m_pkEditor = editor; }
-    /// In the midst of an operation or of a question: nothing new can begin.
+    /// Returns true during an operation or question, when nothing new can begin.
     bool IsBusy() const;
-    /// Brings all of both motions into their views.
+    /// Frames both motions in their views.
     void FrameAll();
 
-    /// The mouse went down on the title.
+    /// Called when the mouse is pressed on the title.
     std::function<void(const QPoint& globalPosition)> titleDown;
-    /// The mouse went down in the icon's corner.
+    /// Called when the mouse is pressed in the icon's corner.
     std::function<void(const QPoint& globalPosition)> cornerDown;
-    /// The options were asked for; the place is where their menu opens.
+    /// Called to open the options menu at a position.
     std::function<void(const QPoint& globalPosition)> options;
 
     EAnswer ShowMessageBox(int id, const std::string& text, EButtons buttons) override;
@@ -93,8 +93,8 @@ private:
     std::map<std::string, QWidget*, std::less<>> m_kChildren;
     std::map<int, std::unique_ptr<QTimer>> m_kTimers;
     CProfileCombo m_kCombo;
-    std::vector<CReport> m_kReports; ///< of the present step, or of the last one until the next begins
-    QElapsedTimer m_kSincePainted;   ///< within an operation
+    std::vector<CReport> m_kReports; ///< of the current step, or of the last one until the next begins
+    QElapsedTimer m_kSincePainted;   ///< during an operation
     int m_iWaits = 0;
 };
 

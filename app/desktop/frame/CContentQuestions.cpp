@@ -1,4 +1,4 @@
-// What the face asks of the user and of the desktop around it.
+// The face's questions to the user, and its use of the desktop environment.
 
 #include "CContent.h"
 #include "CGaitConvertContent.h"
@@ -16,7 +16,7 @@ namespace gw {
 
 namespace {
 
-// The arrow in place of the wait cursor, for as long as something is asked in the midst of an operation.
+// Shows the arrow instead of the wait cursor while a question interrupts an operation.
 class CArrowCursor
 {
 public:
@@ -31,7 +31,7 @@ public:
 EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons buttons)
 {
     const CArrowCursor arrow;
-    // Reports are cleared when a step begins, so outside of one they belong to an earlier step.
+    // Reports are cleared when a step begins, so outside a step they are from an earlier one.
     const std::string details = m_iWaits > 0 && EndsStep(id) ? Notes() : std::string();
     return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, details);
 }

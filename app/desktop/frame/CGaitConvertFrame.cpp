@@ -1,3 +1,6 @@
+// The frameless main window: moves with the mouse on its title, restores its position, and maps keys to the
+// controls of its face.
+
 #include "CGaitConvertFrame.h"
 
 #include "CContent.h"
@@ -87,7 +90,7 @@ CGaitConvertFrame::CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, C
     AddShortcuts();
 }
 
-// The face and the editor look at the conversion until their end.
+// Face and editor refer to the conversion until they are destroyed.
 CGaitConvertFrame::~CGaitConvertFrame()
 {
     delete m_pkEditor;
@@ -96,7 +99,7 @@ CGaitConvertFrame::~CGaitConvertFrame()
     m_spContent.reset();
 }
 
-// A stored place counts where the window can be seen there; the size is always the skin's.
+// A stored position is used only if the window is visible there; the size is always the skin's.
 void CGaitConvertFrame::Place(const QSize& size)
 {
     setFixedSize(size);
@@ -116,7 +119,7 @@ void CGaitConvertFrame::AddShortcuts()
         auto* const button = findChild<QAbstractButton*>(QLatin1String(key.child));
         add(key.keys, [button] { button->click(); });
     }
-    // No click: the left Ctrl key would make a batch run of it.
+    // Not a click: with the left Ctrl key, that would start a batch run.
     add(Qt::CTRL | Qt::Key_O, [this] { m_spContent->OpenSource(); });
     add(QKeyCombination(Qt::Key_F), [this] { m_pkFace->FrameAll(); });
 }
@@ -145,7 +148,7 @@ void CGaitConvertFrame::RaiseAndOpen(const std::string& path)
 void CGaitConvertFrame::closeEvent(QCloseEvent* event)
 {
     if (QWidget* field = QApplication::focusWidget())
-        field->clearFocus(); // what is being typed counts
+        field->clearFocus(); // commits the text being typed
     if (m_pkFace->IsBusy() || !m_spContent->MayClose())
     {
         event->ignore();

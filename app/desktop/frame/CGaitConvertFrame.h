@@ -17,8 +17,7 @@ class CPlatform;
 class CProfileEditorWindow;
 class CSkin;
 
-/// The main window: a frame without a border around its face, with the conversion behind it. Its size is the
-/// skin's.
+/// The main window: a borderless frame around its face, and the conversion. The skin determines its size.
 class CGaitConvertFrame : public QWidget
 {
 public:
@@ -27,10 +26,10 @@ public:
     ~CGaitConvertFrame() override;
 
     CGaitConvertContent& Content() { return *m_spContent; }
-    /// Opens what somebody else names (another start of the program, a drop), as soon as nothing else is
-    /// under way.
+    /// Opens a file requested from outside (another start of the program, a drop) as soon as no operation is
+    /// running.
     void OpenSoon(const std::string& path);
-    /// Comes to the front, and opens a file if there is a path.
+    /// Raises the window, and opens a file if the path is not empty.
     void RaiseAndOpen(const std::string& path);
 
 protected:
@@ -51,7 +50,7 @@ private:
     std::unique_ptr<CGaitConvertContent> m_spContent;
     CProfileEditorWindow* m_pkEditor;
     CMessageFilter m_kFilter;
-    std::optional<QPoint> grip_; ///< where the mouse holds the window while it is dragged by hand
+    std::optional<QPoint> grip_; ///< where the mouse holds the window during a drag
 };
 
 } // namespace gw

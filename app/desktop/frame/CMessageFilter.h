@@ -7,15 +7,16 @@
 
 namespace gw {
 
-/// What the application looks at before any window does: Alt+F4, and the second click on the icon's corner,
-/// which closes as a double click on a system menu does.
+/// Handles events before any window: Alt+F4, and the second click on the icon's corner, which closes the
+/// program like a double click on a system menu.
 class CMessageFilter : public QObject
 {
 public:
-    /// Watches every event of the application, which must exist.
+    /// Filters every event of the application, which must exist.
     explicit CMessageFilter(std::function<void()> requestClose);
 
-    /// The corner was clicked: a click on the same place within half a second closes.
+    /// Remembers a click on the corner; another one at the same place within half a second closes the
+    /// program.
     void RememberCorner(const QPoint& globalPosition);
 
     bool eventFilter(QObject* watched, QEvent* event) override;
@@ -24,7 +25,7 @@ private:
     bool IsCornerAgain(const QPoint& globalPosition) const;
 
     std::function<void()> requestClose_;
-    QElapsedTimer m_kSinceCorner; ///< invalid where no click is remembered
+    QElapsedTimer m_kSinceCorner; ///< invalid if no click is remembered
     QPoint m_kCorner;
 };
 

@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-constexpr int kHandleWidth = 14; // the middle of the handle stands at the value
+constexpr int kHandleWidth = 14; // its middle is at the value
 
 } // namespace
 

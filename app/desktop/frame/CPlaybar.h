@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// The bar under the views: goes to where the mouse is pressed, and tells when a drag begins and ends. Keys
+/// The bar under the views: jumps to where the mouse is pressed and reports when a drag begins and ends. Keys
 /// are left to the window.
 class CPlaybar : public QSlider
 {

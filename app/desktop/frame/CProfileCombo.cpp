@@ -13,7 +13,7 @@ namespace {
 
 constexpr double kSizesPerPoint = 10.0;
 
-// Where the skin's style sheet sets a size, that one wins.
+// A size in the skin's style sheet takes precedence.
 void ChangeFont(QWidget& widget, const QString& family, int size)
 {
     QFont font = widget.font();
@@ -72,7 +72,7 @@ void CProfileCombo::SetChildren(QComboBox* field, QAbstractButton* arrow, int fo
     QObject::connect(arrow, &QAbstractButton::clicked, field, &QComboBox::showPopup);
 }
 
-// The toolkit selects the first item of a list by itself; this list selects nothing.
+// The toolkit selects a list's first item by itself; undo that.
 void CProfileCombo::ShowSelection()
 {
     if (!m_kField)

@@ -10,12 +10,12 @@ class QComboBox;
 
 namespace gw {
 
-/// The list of profiles on two children of the face: the field that shows the selected one, and the arrow
+/// The list of profiles, shown by two children of the face: the field with the selected profile and the arrow
 /// that opens the list.
 class CProfileCombo : public CProfileList
 {
 public:
-    /// The notification of a choice by hand.
+    /// Notification code of a choice by the user.
     static constexpr int kChosen = 9;
 
     void AddItem(const std::string& text, int userData) override;
@@ -24,9 +24,9 @@ public:
 
     void SetFont(const std::string& family, int fieldSize, int listSize) override;
 
-    /// Both may die before this. The font size is in tenths of a point.
+    /// Both can be destroyed before this. The font size is in tenths of a point.
     void SetChildren(QComboBox* field, QAbstractButton* arrow, int fontSize);
-    /// What a choice by hand calls, after the selection.
+    /// Called when the user has chosen a profile, after the selection.
     void SetNotify(std::function<void(int code)> notify) { notify_ = std::move(notify); }
 
 private:

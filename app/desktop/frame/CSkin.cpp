@@ -26,7 +26,7 @@ constexpr std::string_view kKinds[] = {
     "toggle",  "view", "bar",     "combo", "arrow",  "line",
 };
 
-// What the program behind the face asks for by name.
+// The children that the program looks up by name.
 constexpr std::string_view kNeededChildren[] = {
     "#title",  "#cnt1", "#cnt2", "|playbar", "#format", "pull", "%adv",    "del",      "open",
     "convert", "apply", "help",  "close",    "exit",    "play", "stop",    "back",     "end",
@@ -38,13 +38,13 @@ bool IsSide(int pixels)
     return pixels > 0 && pixels <= kLongestSide;
 }
 
-// The name of a child without the sign of its kind.
+// Returns a child's name without the character for its kind.
 std::string_view BareName(std::string_view child)
 {
     return child.substr(child.find_first_of("#|%") == 0 ? 1 : 0);
 }
 
-// "kind name left top width height [picture [picture]]"
+// Parses "kind name left top width height [picture [picture]]".
 bool ReadChild(std::string_view line, SkinChild& child)
 {
     child.kind = NextWord(line);
@@ -82,7 +82,7 @@ bool CSkin::Load(const std::string& folder, std::string& problem)
     if (!ReadFile(kLayoutFile, layout, problem) || !ReadFile(kTextFile, m_kTexts, problem) ||
         !ReadFile(kStyleFile, style, problem) || !ReadLayout(layout, problem) || !HasAllParts(problem))
         return false;
-    // Style sheets know paths from the current folder only.
+    // Paths in style sheets are relative to the current folder only.
     m_kStyleSheet =
         ToQString(style).replace(QLatin1String("url(@/"), QLatin1String("url(") + ToQString(m_kFolder));
     return true;

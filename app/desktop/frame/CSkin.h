@@ -10,11 +10,11 @@
 
 namespace gw {
 
-/// One child of the window's face, as the skin places it.
+/// One child of the window's face, placed by the skin.
 struct SkinChild
 {
     std::string kind;
-    std::string name; ///< "#" begins displays, "|" scroll bars, "%" two-state buttons
+    std::string name; ///< starts with "#" for displays, "|" for scroll bars, "%" for two-state buttons
     QRect place;      ///< in pixels at scale 1
     std::string icon; ///< a picture's name, or empty
     std::string secondIcon;
@@ -25,16 +25,16 @@ struct SkinChild
 class CSkin
 {
 public:
-    /// False, with words on what is missing or wrong, when the folder holds no whole skin.
+    /// Loads a skin. Returns false, with a description of the problem, if the folder has no complete skin.
     bool Load(const std::string& folder, std::string& problem);
 
     QSize Size() const { return m_kSize; }
     const std::vector<SkinChild>& Children() const { return m_kChildren; }
     const QString& StyleSheet() const { return m_kStyleSheet; }
-    /// The text of a child: what it shows, or with ".name" or ".tip" behind the child's name how it is called
-    /// and what its tool tip says. Empty where the skin has none.
+    /// Returns the text that a child shows, or with the aspect "name" or "tip" its accessible name or tool
+    /// tip. Empty if the skin has none.
     QString Text(std::string_view child, std::string_view aspect = {}) const;
-    /// Crisp at every scale, dimmed where it is disabled; empty for an empty name.
+    /// Returns an icon, sharp at every scale and dimmed if disabled; empty for an empty name.
     QIcon Icon(const std::string& name) const;
 
 private:

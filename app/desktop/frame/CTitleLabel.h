@@ -5,13 +5,13 @@
 
 namespace gw {
 
-/// The window's title: cut with dots where it is too long, whole in its tool tip.
+/// The window's title: elided if it is too long, shown in full in its tool tip.
 class CTitleLabel : public QLabel
 {
 public:
     explicit CTitleLabel(QWidget* parent) : QLabel(parent) {}
 
-    /// Paints at once, also while an operation keeps the program from its events.
+    /// Paints immediately, even while an operation blocks the event loop.
     void ShowAtOnce(const QString& text);
 
     std::function<void(const QPoint& globalPosition)> mouseDown;

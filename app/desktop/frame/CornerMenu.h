@@ -6,8 +6,8 @@ namespace gw {
 
 class CGaitConvertFrame;
 
-/// The menu of the icon's corner: the sources that were opened last, and what a window menu offers. Deletes
-/// itself when it is closed.
+/// Creates the menu of the icon's corner: recent sources and the commands of a window menu. It deletes itself
+/// when closed.
 QMenu* MakeCornerMenu(CGaitConvertFrame& frame);
 
 } // namespace gw

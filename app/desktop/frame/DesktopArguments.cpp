@@ -14,8 +14,8 @@ bool IsFlag(const QString& argument)
            (argument.startsWith(QLatin1Char('/')) && !QFileInfo::exists(argument));
 }
 
-// A small s at the head selects the tool, or a capital one in the second place. That "-S" alone does not is
-// how the flag has always been read.
+// A lowercase s as the first letter selects the tool, or an uppercase one as the second. That "-S" alone does
+// not is how the flag has always been read.
 bool IsToolFlag(const QString& flag)
 {
     return flag.startsWith(QLatin1Char('s')) || (flag.size() > 1 && flag[1] == QLatin1Char('S'));

@@ -5,17 +5,17 @@
 
 namespace gw {
 
-/// What the desktop program was started for.
+/// The parsed arguments of the desktop program.
 struct DesktopArguments
 {
     bool mapTool = false;
     bool resetCounter = false;
     bool help = false;
-    std::string file; ///< to be opened, or empty
+    std::string file; ///< the file to open, or empty
 };
 
-/// Reads the arguments behind the program's name. A flag is what begins with a minus sign, or with a slash
-/// where no file of that name is there; unknown flags are passed over.
+/// Parses the arguments after the program's name. A flag starts with a minus sign, or with a slash if no file
+/// has that name; unknown flags are ignored.
 DesktopArguments ReadArguments(const QStringList& arguments);
 
 } // namespace gw

@@ -68,8 +68,8 @@ QWidget* MakeView(const CLeftKeys& keys, QWidget* face)
     return words;
 }
 
-// A list that is as wide as its texts, under a field that is as wide as the skin says: what tells profiles of
-// a family apart stands at the end of their names.
+// Makes the list as wide as its texts, below a field as wide as the skin says, because profiles of one family
+// differ at the end of their names.
 class CProfileField : public QComboBox
 {
 public:
@@ -123,7 +123,7 @@ CFaceButton::CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* fac
     : QPushButton(face), m_kFirst(skin.Icon(child.icon)),
       m_kSecond(child.secondIcon.empty() ? m_kFirst : skin.Icon(child.secondIcon))
 {
-    // A blank keeps the text off the picture.
+    // A blank keeps the text away from the picture.
     const QString text = skin.Text(child.name);
     setText(text.isEmpty() || child.icon.empty() ? text : QLatin1Char(' ') + text);
     setCheckable(child.kind == "toggle");

@@ -8,13 +8,13 @@ namespace gw {
 
 class CLeftKeys;
 
-/// A button of the face with a picture for each of its two faces. Enter clicks it: the space bar plays.
+/// A button of the face with one picture per state. Enter clicks it, because the space bar plays.
 class CFaceButton : public QPushButton
 {
 public:
     CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* face);
 
-    /// 0 is the first picture, anything else the second one.
+    /// Shows the first picture for 0, otherwise the second.
     void SetFace(int face) { setIcon(face == 0 ? m_kFirst : m_kSecond); }
 
 protected:
@@ -25,7 +25,7 @@ private:
     QIcon m_kSecond;
 };
 
-/// Makes the widget of a child, named, placed and with its texts. The face owns it.
+/// Creates the widget of a child with name, position and texts. The face owns it.
 QWidget* MakeFaceChild(const SkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face);
 
 } // namespace gw

@@ -35,7 +35,7 @@ constexpr const char* kBlocked =
     "GaitForge: another instance seems to be running, but it does not respond. If it crashed, run:\n"
     "GaitForge --reset-instance-counter\n";
 
-// Says what keeps the program from working, in a window and for whoever started it from a shell.
+// Reports why the program cannot run, in a window and on standard error.
 void Complain(const std::string& words)
 {
     std::fprintf(stderr, "GaitForge: %s\n", words.c_str());
@@ -58,13 +58,13 @@ void CheckTarget(const CPlatform& platform)
                  "\" is missing. You can view motions, but not convert them.");
 }
 
-// Copies of the program in different folders do not know of each other.
+// Copies of the program in different folders are independent of each other.
 std::string CounterName()
 {
     return "gaitforge-" + std::to_string(std::hash<std::string>()(ExecutableFolder()));
 }
 
-// The program's place among its instances, given back at the end unless there was none.
+// The program's slot in the instance counter, released at the end if it was taken.
 class CInstanceShare
 {
 public:
@@ -92,7 +92,8 @@ int ShowMainWindow(const std::string& file, CPlatform& platform, const CLeftKeys
     CGaitConvertFrame frame(skin, keys, platform);
     const CInstanceServer server([&frame](const std::string& path) { frame.RaiseAndOpen(path); });
     frame.show();
-    // In the application's loop: outside it, a request to quit would only close the box and be forgotten.
+    // Posted to the application's loop: outside it, a request to quit would only close the box and be
+    // forgotten.
     QTimer::singleShot(0, &frame, [&] {
         frame.RaiseAndOpen(file);
         CheckTarget(platform);
@@ -111,7 +112,7 @@ int InitMain(const std::string& file, CPlatform& platform, const CLeftKeys& keys
     return EXIT_FAILURE;
 }
 
-// The tool borrows the skin's colors, and works without them.
+// The tool uses the skin's colors if they are available.
 int RunTool(CPlatform& platform, const CLeftKeys& keys)
 {
     CSkin skin;
@@ -127,7 +128,7 @@ int InitInstance(const DesktopArguments& arguments)
     return arguments.mapTool ? RunTool(platform, keys) : InitMain(arguments.file, platform, keys);
 }
 
-// What needs no screen. None where a window is asked for.
+// Handles arguments that need no screen. Returns nothing if a window is needed.
 std::optional<int> RunWithoutWindow(const DesktopArguments& arguments)
 {
     if (arguments.help)
@@ -140,7 +141,7 @@ std::optional<int> RunWithoutWindow(const DesktopArguments& arguments)
     return std::nullopt;
 }
 
-// The toolkit aborts where it finds no screen.
+// The toolkit aborts without a screen.
 bool HasDisplay()
 {
 #if defined(__linux__)
@@ -172,7 +173,7 @@ int RunDesktop(int argc, char** argv)
     RequestPreviewFormat();
     QApplication application(argc, argv);
     QApplication::setStyle(QStyleFactory::create(QStringLiteral("Fusion")));
-    QLocale::setDefault(QLocale::c()); // numbers look and read the same on every desktop
+    QLocale::setDefault(QLocale::c()); // same number format on every desktop
     QuitOnSignals(&application);
     return InitInstance(ReadArguments(QApplication::arguments().mid(1)));
 }

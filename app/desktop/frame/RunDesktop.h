@@ -2,7 +2,7 @@
 
 namespace gw {
 
-/// The whole desktop program, from its command line to its exit code.
+/// Runs the desktop program and returns its exit code.
 int RunDesktop(int argc, char** argv);
 
 } // namespace gw

@@ -4,7 +4,7 @@ class QWidget;
 
 namespace gw {
 
-/// Shows the map tool's name and the program's version over a window until the user ends it.
+/// Shows the map tool's name and the program's version over a window until the user closes it.
 void ShowAboutBox(QWidget& owner);
 
 } // namespace gw

@@ -21,9 +21,9 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kShownCharacters = 300; // of a line; its end is of no use in a list
+constexpr size_t kShownCharacters = 300; // of a line; the rest is not useful in a list
 
-// A line as a list can show it: not too long, and without characters that would break it.
+// Returns a line for display in a list: shortened, and without characters that would break it.
 QString ShownLine(const MapLine& line)
 {
     return ToQString(Printable(FirstCharacters(line.text, kShownCharacters)));
@@ -47,7 +47,7 @@ CGaitToolWindow::CGaitToolWindow(const CPlatform& platform, const CLeftKeys& key
 
 CGaitToolWindow::~CGaitToolWindow() = default;
 
-// ---- what the user does
+// ---- user actions
 
 void CGaitToolWindow::Forward(const std::function<void()>& operation)
 {
@@ -55,7 +55,7 @@ void CGaitToolWindow::Forward(const std::function<void()>& operation)
     Refresh();
 }
 
-// Showing a selection is not making one.
+// Showing a selection must not count as making one.
 void CGaitToolWindow::SelectLine(const QModelIndex& line)
 {
     if (!m_bShowing)
@@ -79,7 +79,7 @@ void CGaitToolWindow::contextMenuEvent(QContextMenuEvent* event)
     m_pkMenu->popup(event->globalPos());
 }
 
-// The Escape key of a dialog would end the program with a map that is not saved.
+// A dialog's Escape key would end the program with an unsaved map.
 void CGaitToolWindow::keyPressEvent(QKeyEvent* event)
 {
     if (event->key() == Qt::Key_Escape)
@@ -88,7 +88,7 @@ void CGaitToolWindow::keyPressEvent(QKeyEvent* event)
         QDialog::keyPressEvent(event);
 }
 
-// ---- what the tool asks
+// ---- questions from the tool
 
 std::optional<std::string> CGaitToolWindow::AskOpenFile(const FileDialogSetup& setup)
 {
@@ -124,7 +124,7 @@ void CGaitToolWindow::EndWaitCursor()
     QApplication::restoreOverrideCursor();
 }
 
-// ---- what it shows
+// ---- display
 
 void CGaitToolWindow::Refresh()
 {

@@ -22,7 +22,7 @@ class CBoneTreeView;
 class CLeftKeys;
 class CMotionPanel;
 
-/// The window of the map tool: shows what the tool answers, forwards what the user does.
+/// The window of the map tool: shows the tool's state and forwards user actions.
 class CGaitToolWindow : public QDialog, private CToolWindow
 {
 public:
@@ -57,7 +57,7 @@ private:
     QPushButton* MakeButton(int id);
     CMotionPanel& Panel(EToolMotion motion) { return *m_kPanels[static_cast<size_t>(motion)]; }
 
-    /// Hands something to the tool and shows what came of it.
+    /// Runs an operation of the tool and shows its outcome.
     void Forward(const std::function<void()>& operation);
     void SelectLine(const QModelIndex& line);
     void Click(int id);
@@ -75,8 +75,8 @@ private:
     QStringListModel m_kLineTexts;
     std::vector<QPushButton*> m_kButtons;
     QTimer m_kClock;
-    bool m_bShowing = false; // what the tool has
-    CGaitToolDialog m_kTool; // last: its views may draw on the panels until it dies
+    bool m_bShowing = false; // the tool's state is being shown
+    CGaitToolDialog m_kTool; // last, because its views may draw on the panels until they are destroyed
 };
 
 } // namespace gw

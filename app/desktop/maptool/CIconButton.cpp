@@ -10,9 +10,9 @@ namespace gw {
 namespace {
 
 constexpr QSize kButtonSize(36, 26);
-constexpr qreal kIconSide = 16; // the pictures' own square
+constexpr qreal kIconSide = 16; // size of the pictures' coordinate square
 
-// A picture is up to three areas of four corners; a triangle has two corners in one place.
+// A picture has up to three areas of four corners; a triangle has two equal corners.
 struct Area
 {
     qreal m_afCorners[8];
@@ -50,13 +50,13 @@ constexpr Area kLineBottom{
     {2, 11, 14, 11, 14, 13, 2, 13}
 };
 
-// By EButtonIcon.
+// Indexed by EButtonIcon.
 constexpr Area kPictures[][3] = {
-    {kBarLeft, kLeftOfBar,  kNothing   }, // the first frame
-    {kToLeft,  kBarRight,   kNothing   }, // a frame back
+    {kBarLeft, kLeftOfBar,  kNothing   }, // first frame
+    {kToLeft,  kBarRight,   kNothing   }, // previous frame
     {kSquare,  kNothing,    kNothing   }, // stop
     {kToRight, kNothing,    kNothing   }, // play
-    {kBarLeft, kRightOfBar, kNothing   }, // a frame on
+    {kBarLeft, kRightOfBar, kNothing   }, // next frame
     {kLineTop, kLineMiddle, kLineBottom}, // menu
 };
 
@@ -85,7 +85,7 @@ CIconButton::CIconButton(EButtonIcon icon, const QString& name, QWidget* parent)
     setAccessibleName(name);
     setToolTip(name);
     setAutoDefault(false);
-    setProperty("kind", QStringLiteral("button")); // no room for a text
+    setProperty("kind", QStringLiteral("button")); // no padding for text
 }
 
 QSize CIconButton::sizeHint() const

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// The pictures that the map tool's small buttons carry.
+/// The pictures on the map tool's small buttons.
 enum class EButtonIcon : uint8_t
 {
     SeekStart,
@@ -16,8 +16,8 @@ enum class EButtonIcon : uint8_t
     Menu,
 };
 
-/// A push button with a picture in its text's colour, drawn at any scale. What it does is said by its
-/// accessible name and its tool tip, which are the same.
+/// A push button with a picture in its text color, drawn at any scale. Its accessible name, also used as tool
+/// tip, describes it.
 class CIconButton : public QPushButton
 {
 public:

@@ -20,7 +20,7 @@ namespace {
 
 constexpr int kFieldWidth = 220;
 
-// The dialog of a kind of line: its number, which it has always had, its title, and what its fields are.
+// The dialog of a kind of line: its number, which never changes, its title and its fields.
 struct Template
 {
     EMapLine m_eKind;
@@ -109,7 +109,7 @@ void CMapLineDialog::AddNumber(QFormLayout& form, const QString& label, int valu
     field->setObjectName(label);
     field->setAccessibleName(label);
     field->setButtonSymbols(QAbstractSpinBox::NoButtons);
-    // What a line holds is shown, whatever it is.
+    // Any value in a line can be shown.
     field->setRange(std::numeric_limits<int>::min(), std::numeric_limits<int>::max());
     field->setValue(value);
     field->setFixedWidth(kFieldWidth);

@@ -10,13 +10,13 @@ class QFormLayout;
 
 namespace gw {
 
-/// Edits one map line: a mapping's rotation, the position, the frame rate, or a text, as its kind asks for.
+/// Edits one map line: a mapping's rotation, the position, the frame rate, or a text, depending on its kind.
 class CMapLineDialog : public QDialog
 {
 public:
     CMapLineDialog(const MapLine& line, QWidget* owner);
 
-    /// The line with what the fields hold.
+    /// Returns the line with the values of the fields.
     MapLine Line() const;
 
 private:
@@ -27,7 +27,7 @@ private:
     void AddText(QFormLayout& form);
 
     MapLine m_kLine;
-    std::vector<std::function<void(MapLine&)>> m_kStore; // one a field
+    std::vector<std::function<void(MapLine&)>> m_kStore; // one per field
 };
 
 } // namespace gw

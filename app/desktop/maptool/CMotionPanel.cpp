@@ -22,7 +22,7 @@ constexpr const char* kContext = "GaitTool";
 constexpr int kPictureSide = 200;
 constexpr int kPanelGap = 6;
 
-// By EToolMotion.
+// Indexed by EToolMotion.
 constexpr const char* kCaptions[] = {
     QT_TRANSLATE_NOOP("GaitTool", "Source"),
     QT_TRANSLATE_NOOP("GaitTool", "Target"),
@@ -35,7 +35,7 @@ struct TransportButton
     const char* m_pcName;
 };
 
-// In the order of kTransportIds.
+// In kTransportIds order.
 constexpr TransportButton kTransportButtons[] = {
     {EButtonIcon::SeekStart,   QT_TRANSLATE_NOOP("GaitTool", "First frame")   },
     {EButtonIcon::StepBack,    QT_TRANSLATE_NOOP("GaitTool", "Previous frame")},
@@ -49,7 +49,7 @@ QString CaptionOf(EToolMotion motion)
     return QCoreApplication::translate(kContext, kCaptions[static_cast<size_t>(motion)]);
 }
 
-// The first motion file among what is dragged; empty when there is none.
+// Returns the first motion file in dragged data; empty if there is none.
 QString MotionFileOf(const QMimeData& mime)
 {
     for (const QUrl& url : mime.urls())

@@ -14,20 +14,20 @@ namespace gw {
 class CLeftKeys;
 class CPreviewWidget;
 
-/// One of the map tool's three previews: caption, picture, five transport buttons. A motion file may be
+/// One of the map tool's three previews: caption, picture, five transport buttons. Motion files can be
 /// dropped on it.
 class CMotionPanel : public QWidget
 {
 public:
-    /// The keys must outlive the panel.
+    /// `keys` must outlive the panel.
     CMotionPanel(EToolMotion motion, const CLeftKeys& keys, QWidget* parent);
 
-    /// A new view that is drawn here; where there is no GL, one that is not drawn.
+    /// Creates a view. Without GL, the view draws nothing.
     std::unique_ptr<CMotionView> MakeView();
     void ShowFrame(int frame, int lastFrame);
     /// Called with the id of a transport button.
     void SetClicked(std::function<void(int id)> clicked) { clicked_ = std::move(clicked); }
-    /// Called with a dropped motion file. Without this, nothing may be dropped.
+    /// Called with a dropped motion file. If not set, nothing can be dropped.
     void SetDropped(std::function<void(const QString& path)> dropped);
 
 protected:

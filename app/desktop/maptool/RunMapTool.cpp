@@ -6,8 +6,8 @@
 
 namespace gw {
 
-// By the application's own loop and not by the dialog's: only that one ends when the system asks the program
-// to.
+// Runs in the application's own loop instead of the dialog's: only that one ends when the system asks the
+// program to end.
 int RunMapTool(CPlatform& platform, const CLeftKeys& keys)
 {
     CGaitToolWindow window(platform, keys);

@@ -1,5 +1,5 @@
-// How the map tool's window is laid out: three columns, in the order of the work from the top to the bottom,
-// which is also the order of the tab key.
+// The layout of the map tool's window: three columns, each from top to bottom in working order, which is also
+// the Tab order.
 
 #include "AboutBox.h"
 #include "CBoneTreeView.h"
@@ -101,7 +101,7 @@ void CGaitToolWindow::MakeTop(QGridLayout& grid)
     auto* const menu = new CIconButton(EButtonIcon::Menu, ToolText("Window menu"), this);
     menu->setObjectName(QStringLiteral("menuButton"));
     connect(menu, &QPushButton::clicked, this, [this, menu] {
-        // Right edges in line, so that it stays above the window.
+        // Aligned at the right edges, so that the menu stays within the window.
         const QPoint below = menu->mapToGlobal(menu->rect().bottomRight());
         m_pkMenu->popup(below - QPoint(m_pkMenu->sizeHint().width(), 0));
     });
@@ -153,7 +153,7 @@ void CGaitToolWindow::MakeLines(QGridLayout& grid)
     m_pkLines->setEditTriggers(QAbstractItemView::NoEditTriggers);
     m_pkLines->setUniformItemSizes(true);
     m_pkLines->setSpacing(1);
-    // Arrow keys change the current line; a click on the line that is current already counts as well.
+    // Arrow keys change the current line; clicking the current line counts as selecting it too.
     const auto select = [this](const QModelIndex& line) { SelectLine(line); };
     connect(m_pkLines->selectionModel(), &QItemSelectionModel::currentChanged, this, select);
     connect(m_pkLines, &QListView::clicked, this, select);
@@ -171,7 +171,7 @@ void CGaitToolWindow::MakeStatus(QGridLayout& grid)
     m_pkStatus->setAccessibleName(ToolText("Status"));
     m_pkStatus->setTextFormat(Qt::PlainText);
     m_pkStatus->setWordWrap(true);
-    // Two lines always, so that nothing moves with the words, and no word makes the window wider.
+    // Always two lines high, so that nothing moves when the text changes, and no text widens the window.
     m_pkStatus->setFixedHeight(2 * fontMetrics().lineSpacing());
     m_pkStatus->setSizePolicy(QSizePolicy::Ignored, QSizePolicy::Fixed);
     grid.addWidget(m_pkStatus, kStatusRow, 0, 1, kColumns - 1);
@@ -194,7 +194,7 @@ QPushButton* CGaitToolWindow::MakeButton(int id)
     auto* const button = new QPushButton(ToolText(text->m_pcText), this);
     button->setObjectName(QString::number(id));
     button->setAccessibleName(button->text());
-    button->setAutoDefault(false); // Enter in a tree or list is not a click
+    button->setAutoDefault(false); // Enter in a tree or list must not click it
     button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Preferred); // as high as its row
     connect(button, &QPushButton::clicked, this, [this, id] { Click(id); });
     m_kButtons.push_back(button);

@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-// A hollow dot is a bone that no row maps. The two trees have colours of their own.
+// A hollow dot is a bone that no row maps. Each of the two trees has its own color.
 struct Image
 {
     const char* what;
@@ -27,7 +27,7 @@ constexpr Image kImages[] = {
 constexpr qreal kDotShare = 0.5; // of the icon's size
 constexpr qreal kRingShare = 0.1;
 
-// Draws the dot at whatever size it is asked for, instead of scaling a picture.
+// Draws the dot at the requested size instead of scaling a picture.
 class CMarkerEngine : public QIconEngine
 {
 public:

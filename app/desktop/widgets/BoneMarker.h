@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// The marker of a bone in a tree, by the numbers of its two images: as it is, and while it is selected.
-/// Sharp at every scale. Empty for numbers that have no image.
+/// Returns the marker of a bone in a tree from the numbers of its two images: normal and selected. Sharp at
+/// every scale. Empty for unknown numbers.
 QIcon BoneMarker(int image, int selectedImage);
 
 } // namespace gw

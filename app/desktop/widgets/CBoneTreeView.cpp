@@ -32,7 +32,7 @@ std::vector<int> AllItems(const CBoneTree& tree)
 CBoneTreeView::CBoneTreeView(QWidget* parent) : QTreeWidget(parent)
 {
     setHeaderHidden(true);
-    setUniformRowHeights(true); // so that a large tree is not measured row by row
+    setUniformRowHeights(true); // avoids measuring every row of a large tree
     setTextElideMode(Qt::ElideMiddle);
     connect(this, &QTreeWidget::itemCollapsed, this,
             [this](const QTreeWidgetItem* item) { NoteFolding(item, true); });
@@ -59,7 +59,7 @@ void CBoneTreeView::ShowTree(const CBoneTree& tree, const std::string& filter)
     m_kFilter = filter;
     Build(tree);
     ShowSelection(tree);
-    if (sameList) // a bone that moved within the list takes nobody along
+    if (sameList) // a bone that moved within the list does not move its children
         verticalScrollBar()->setValue(scroll);
 }
 
@@ -78,7 +78,7 @@ void CBoneTreeView::TakeBones(const CBoneTree& tree)
         m_kBones.push_back({item.m_kText, item.m_iParent});
 }
 
-// The items are put together first and given to the widget at once, which then lays them out once.
+// Builds all items first and adds them in one step, so that the widget lays them out only once.
 void CBoneTreeView::Build(const CBoneTree& tree)
 {
     clear();
@@ -92,7 +92,7 @@ void CBoneTreeView::Build(const CBoneTree& tree)
         if (parent == CBoneTree::kNone)
             top.push_back(made);
         else
-            BoneOf(parent).m_pkItem->addChild(made); // a parent comes before its children
+            BoneOf(parent).m_pkItem->addChild(made); // parents come before their children
     }
     setRootIsDecorated(!IsFlat());
     addTopLevelItems(top);

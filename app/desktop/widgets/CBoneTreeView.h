@@ -9,17 +9,16 @@
 
 namespace gw {
 
-/// A tree of bones on the screen. Knows what it shows, so that a tree that only changed
-/// its markers or its selection is not built again: scroll position and folded bones stay.
+/// A tree of bones on the screen. It remembers what it shows, so that a tree in which only markers or
+/// selection changed is not rebuilt: scroll position and collapsed bones are kept.
 class CBoneTreeView : public QTreeWidget
 {
 public:
     explicit CBoneTreeView(QWidget* parent);
 
-    /// Tells of the item that the user selected, or kNone.
+    /// Called with the item that the user selected, or kNone.
     void SetOnSelect(std::function<void(int item)> onSelect) { onSelect_ = std::move(onSelect); }
-    /// Shows a tree as it stands: all of it for an empty filter, else a flat list of the bones that the
-    /// filter finds.
+    /// Shows a tree: completely if the filter is empty, otherwise a flat list of the matching bones.
     void ShowTree(const CBoneTree& tree, const std::string& filter);
 
 protected:
@@ -47,10 +46,10 @@ private:
     Bone& BoneOf(int item) { return m_kBones[static_cast<size_t>(item)]; }
 
     std::function<void(int item)> onSelect_ = [](int) {};
-    std::vector<Bone> m_kBones; ///< by the tree's items
-    std::vector<int> m_kOrder;  ///< the items that are shown, from the top on
+    std::vector<Bone> m_kBones; ///< indexed by the tree's items
+    std::vector<int> m_kOrder;  ///< visible items from top to bottom
     std::string m_kFilter;
-    bool m_bShowing = false; ///< changes come from the tree and not from the user
+    bool m_bShowing = false; ///< changes come from the tree, not the user
 };
 
 } // namespace gw

@@ -16,11 +16,11 @@ namespace gw {
 namespace {
 
 constexpr const char* kWindowClass = "TK_KESTRO_GAIT_CONV_1";
-constexpr qsizetype kLongestSocketPath = 107; // bytes: what the system's address of a socket holds
+constexpr qsizetype kLongestSocketPath = 107; // maximum length of a socket's address in bytes
 constexpr int kClientMilliseconds = 800;
-constexpr int kServerMilliseconds = 2000; // after which a caller who says nothing is sent away
+constexpr int kServerMilliseconds = 2000; // after which a silent client is disconnected
 
-// Whether only the user can put something into a folder.
+// Returns whether only the user can write to a folder.
 bool IsPrivate(const QString& path)
 {
     const QFileInfo folder(path);
@@ -29,7 +29,7 @@ bool IsPrivate(const QString& path)
            !(folder.permissions() & kOthers);
 }
 
-// A folder with the user's id in its name, made where it is missing.
+// Returns a folder with the user's id in its name, created if necessary.
 QString OwnFolder()
 {
     const QString path = QDir::tempPath() + QStringLiteral("/gaitwright-") + QString::number(geteuid());
@@ -61,7 +61,7 @@ CInstanceServer::CInstanceServer(Raise raise, QObject* parent) : QObject(parent)
     Listen();
 }
 
-// Without socket options: with them the toolkit takes a living owner's name away.
+// Without socket options: with them, the toolkit takes over the name of a running owner.
 void CInstanceServer::Listen()
 {
     const QString path = InstanceSocketPath();
@@ -99,14 +99,14 @@ void CInstanceServer::Receive(QLocalSocket& socket)
     socket.write(&kMessageAnswer, 1);
     socket.flush();
     socket.disconnectFromServer();
-    // Later: opening a file may ask something, and the caller is not to wait for that.
+    // Deferred: opening a file can ask questions, and the client must not wait for the answers.
     QMetaObject::invokeMethod(
         this, [this, path] { m_kRaise(path); }, Qt::QueuedConnection);
 }
 
 bool RaiseFirstInstance(const std::string& path)
 {
-    // The first instance may stand in another folder.
+    // The first instance can have another current folder.
     const std::string absolute =
         path.empty() ? path : ToUtf8(QDir::current().absoluteFilePath(ToQString(path)));
     const QDeadlineTimer deadline(kClientMilliseconds);

@@ -8,16 +8,16 @@ class QLocalSocket;
 
 namespace gw {
 
-/// The first instance's ear: later starts ask it to come to the front, and may hand it a file to open. Only
-/// processes of the same user reach it. What is no such request is passed over.
+/// The server of the first instance: later starts ask it to come to the front and can pass a file to open.
+/// Only processes of the same user can reach it. Other messages are ignored.
 class CInstanceServer : public QObject
 {
 public:
-    /// Gets the absolute path of a file to open, or an empty one.
+    /// Called with the absolute path of a file to open, or an empty one.
     using Raise = std::function<void(const std::string& path)>;
 
-    /// Listens at once, in the place of an owner that died if need be. It is silent where a living one
-    /// listens and where the system gives no socket.
+    /// Starts listening, replacing a dead owner if necessary. Does nothing if another instance is listening
+    /// or no socket is available.
     explicit CInstanceServer(Raise raise, QObject* parent = nullptr);
 
     bool IsListening() const { return m_kServer.isListening(); }
@@ -31,12 +31,11 @@ private:
     Raise m_kRaise;
 };
 
-/// Asks the first instance to come to the front and to open a file, if there is a path. Whether a living one
-/// answered; waits for less than a second.
+/// Asks the first instance to come to the front and to open a file, unless the path is empty. Returns whether
+/// an instance replied; waits less than a second.
 bool RaiseFirstInstance(const std::string& path = {});
 
-/// Where first and later instances meet: the absolute path of a socket in a folder of the user's own. Empty
-/// where there is no such folder.
+/// Returns the absolute path of the socket, in a folder owned by the user; empty without such a folder.
 QString InstanceSocketPath();
 
 } // namespace gw

@@ -16,7 +16,7 @@ std::optional<EKey> LeftKey(const QKeyEvent& event)
     constexpr quint32 kLeftCtrl = 0xa2;
     constexpr quint32 kLeftShift = 0xa0;
 #else
-    constexpr quint32 kLeftCtrl = 0xffe3; // the key symbols of X
+    constexpr quint32 kLeftCtrl = 0xffe3; // X key symbols
     constexpr quint32 kLeftShift = 0xffe1;
 #endif
     switch (event.nativeVirtualKey())
@@ -37,8 +37,8 @@ CLeftKeys::CLeftKeys(Query query, QObject* parent) : QObject(parent), m_kQuery(s
     QCoreApplication::instance()->installEventFilter(this);
 }
 
-// One window of the program that loses the keyboard to another keeps the keys: a click on an inactive window
-// activates it before the button hears of the click.
+// When one window of the program loses the keyboard to another, the keys are kept: a click on an inactive
+// window activates it before the button receives the click.
 bool CLeftKeys::eventFilter(QObject* watched, QEvent* event)
 {
     switch (event->type())
@@ -67,8 +67,8 @@ bool CLeftKeys::eventFilter(QObject* watched, QEvent* event)
     return QObject::eventFilter(watched, event);
 }
 
-// A click carries the modifiers of its own moment, left or right, even if the program had no focus then. Only
-// a modifier that no left key accounts for needs a question to the system, which takes a round trip.
+// A click carries the modifiers at its own time, left or right, even if the program had no focus then. Only a
+// modifier that no known left key explains requires a query to the system, which takes a round trip.
 void CLeftKeys::Check(EKey key, bool isModified)
 {
     if (!isModified)

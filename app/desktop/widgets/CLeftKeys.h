@@ -9,16 +9,16 @@
 
 namespace gw {
 
-/// Which of the left modifier keys are down: the toolkit's own modifiers do not distinguish left from right.
-/// Keys follow the program's keyboard events, from window to window. Each click checks them, since a key may
-/// have been pressed or released while another program had the keyboard.
+/// Tracks which left modifier keys are down, because the toolkit's modifiers do not distinguish left from
+/// right. Keys are tracked by the program's keyboard events in all windows. Each click verifies them, since a
+/// key may have been pressed or released while another program had the keyboard.
 class CLeftKeys : public QObject
 {
 public:
-    /// Returns the left keys that are down right now, whoever has the keyboard.
+    /// Returns the left keys that are down right now, whichever program has the keyboard.
     using Query = std::function<std::set<EKey>()>;
 
-    /// Watches every event of the application, which must exist.
+    /// Filters every event of the application, which must exist.
     explicit CLeftKeys(Query query = HeldLeftKeys, QObject* parent = nullptr);
 
     bool IsDown(EKey key) const { return m_kDown.contains(key); }

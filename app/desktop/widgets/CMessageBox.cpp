@@ -1,3 +1,6 @@
+// The program's own message box. The toolkit's box cannot scroll its details, wraps paths badly and
+// interprets text that looks like markup, and all three matter for texts that contain file names.
+
 #include "CMessageBox.h"
 
 #include "DialogParts.h"
@@ -56,14 +59,14 @@ std::span<const ButtonRow> RowsOf(EButtons buttons)
 constexpr int kLetterSide = 36;
 constexpr int kTextWidth = 440;
 constexpr int kLeastWidth = 320;
-constexpr double kMostOfScreen = 0.6; // of its height, for the whole box
+constexpr double kMostOfScreen = 0.6; // maximum share of the screen's height for the box
 
 QString BoxText(const char* text)
 {
     return QCoreApplication::translate("CMessageBox", text);
 }
 
-// A ring around a letter, in the colour of the text.
+// A ring around a letter, in the text color.
 class CMessageIcon : public QWidget
 {
 public:
@@ -93,7 +96,7 @@ QWidget* MakeIcon(bool asks)
     return Named(icon, "icon", asks ? BoxText("Question") : BoxText("Information"));
 }
 
-// A path is one long word, which a label would not wrap: it gets places to break at, which are not seen.
+// A path is one long word, which a label would not wrap, so invisible break opportunities are inserted.
 QString Breakable(const QString& text)
 {
     constexpr int kLongWord = 40;
@@ -191,7 +194,7 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
     return layout;
 }
 
-// To the left of the others, and behind them in the order of the keyboard.
+// To the left of the other buttons, but after them in Tab order.
 void CMessageBox::AddDetailsButtons(QBoxLayout& layout)
 {
     m_pkFold = Named(new QToolButton(this), "details", BoxText("Details"));
@@ -220,7 +223,7 @@ void CMessageBox::ShowDetails(bool visible)
     {
         const int margins = 2 * kDialogMargin;
         const int least = 4 * m_pkDetails->fontMetrics().lineSpacing();
-        // The hint and not the height, which a box that is not shown yet does not have.
+        // The size hint instead of the height, which is unknown before the box is shown.
         const int most = static_cast<int>(kMostOfScreen * screen()->availableSize().height()) -
                          sizeHint().height() - margins;
         const int wanted =

@@ -11,23 +11,23 @@ class QToolButton;
 
 namespace gw {
 
-/// How a message box shows its details at first.
+/// The initial state of a message box's details.
 enum class EDetails
 {
     Folded,
     Unfolded,
 };
 
-/// The program's message box: a text, its buttons, and details that fold out under the text. All texts are
-/// plain, whatever is in a file's name. Enter presses the first button; Escape and the close box press the
-/// last one, which is the most careful one of each set.
+/// The program's message box: a text, buttons, and details that unfold below. All texts are plain text,
+/// whatever a file name contains. Enter presses the first button; Escape and the close box press the last
+/// one, which is the safest of each set.
 class CMessageBox : public QDialog
 {
 public:
     CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
                 const QString& details, EDetails shown = EDetails::Folded);
 
-    /// Shows it until it is answered.
+    /// Shows the box until it is answered.
     EAnswer Run();
 
     void reject() override;
@@ -44,7 +44,7 @@ private:
     QToolButton* m_pkFold = nullptr;
 };
 
-/// Shows a message box until it is answered. Without details there is nothing to fold out.
+/// Shows a message box until it is answered. Empty details cannot be unfolded.
 EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
                       const std::string& details = {}, EDetails shown = EDetails::Folded);
 

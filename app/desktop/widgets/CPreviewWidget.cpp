@@ -15,7 +15,7 @@
 
 namespace gw {
 
-// The view and its widget may die in either order.
+// View and widget can be destroyed in either order.
 class CPreviewWidget::CWidgetView : public CGLView
 {
 public:
@@ -49,7 +49,7 @@ bool FailFormat(QWidget* owner, const char* words)
 
 } // namespace
 
-// The toolkit makes the widget's context when it shows it, and would end the program if it could not. So a
+// The toolkit creates the widget's context when it is first shown, and ends the program if that fails. So a
 // context of the same format is tried first.
 bool CPreviewWidget::CWidgetView::SetupPixelFormat()
 {
@@ -72,7 +72,7 @@ std::unique_ptr<CGLView> CPreviewWidget::MakeView()
 {
     auto view = std::make_unique<CWidgetView>(this);
     m_pkView = view.get();
-    if (!view->SetupPixelFormat()) // posted, since the application's loop may not run yet
+    if (!view->SetupPixelFormat()) // posted, because the application's loop may not be running yet
         QMetaObject::invokeMethod(qApp, &QCoreApplication::quit, Qt::QueuedConnection);
     return view;
 }
@@ -115,8 +115,8 @@ void CPreviewWidget::mouseMoveEvent(QMouseEvent* event)
         m_pkView->MouseMove(at.x(), at.y(), {keys_.IsDown(EKey::LeftCtrl), keys_.IsDown(EKey::LeftShift)});
 }
 
-// The toolkit's screens that mix no GL into a window may give a context all the same, and crash in the
-// widget.
+// The toolkit's platforms that cannot combine GL with windows can still provide a context, and then crash in
+// the widget.
 bool HasOpenGL()
 {
     constexpr const char* kScreensWithoutViews[] = {"offscreen", "minimal", "linuxfb", "vnc"};

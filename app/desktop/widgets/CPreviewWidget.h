@@ -9,18 +9,18 @@ namespace gw {
 
 class CLeftKeys;
 
-/// The surface of a view: draws it by GL and forwards the mouse to it. To be made only where HasOpenGL says
-/// so.
+/// The surface of a view: draws it with GL and forwards mouse events. Create it only if HasOpenGL returns
+/// true.
 class CPreviewWidget : public QOpenGLWidget
 {
 public:
-    /// The keys must outlive the widget.
+    /// `keys` must outlive the widget.
     CPreviewWidget(const CLeftKeys& keys, QWidget* parent);
 
-    /// A new view, drawn here from now on and until it dies. It may outlive the widget. If the surface cannot
-    /// have the format that a view needs, the user is told and the program asked to quit.
+    /// Creates a view that is drawn here until it is destroyed; it can outlive the widget. If the surface
+    /// cannot have the required format, the user is told and the program is asked to quit.
     std::unique_ptr<CGLView> MakeView();
-    /// The view that is drawn here, or null.
+    /// Returns the view that is drawn here, or null.
     CGLView* View() const { return m_pkView; }
 
 protected:
@@ -38,10 +38,9 @@ private:
     CGLView* m_pkView = nullptr;
 };
 
-/// Whether the system can make the context that previews are drawn in.
+/// Returns whether the system can create the context that previews need.
 bool HasOpenGL();
-/// Asks the toolkit for that kind of context, for every widget of the program; to be called before the
-/// application exists.
+/// Requests that kind of context for all widgets of the program. Call it before the application exists.
 void RequestPreviewFormat();
 
 } // namespace gw

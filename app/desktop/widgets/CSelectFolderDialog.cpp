@@ -31,15 +31,15 @@ namespace {
 constexpr int kWidth = 520;
 constexpr int kHeight = 400;
 constexpr int kIconSide = 16;
-constexpr int kFilterHeight = 35; // more of it where a filter is shown
+constexpr int kFilterHeight = 35; // additional height if a filter is shown
 
 QString DialogText(const char* text)
 {
     return QCoreApplication::translate("CSelectFolderDialog", text);
 }
 
-// Files are there to be seen: they tell that this is the right folder, and cannot be chosen. The model's own
-// icons are there only where a desktop's theme is.
+// Files are shown only so that the user recognizes the folder, and cannot be chosen. The model's own icons
+// exist only with a desktop theme.
 class CFolderModel : public QFileSystemModel
 {
 public:
@@ -203,7 +203,7 @@ QString CSelectFolderDialog::FolderThatIsOpen() const
 
 void CSelectFolderDialog::keyPressEvent(QKeyEvent* event)
 {
-    // The list has opened a folder then and passes the key on, which would end the dialog.
+    // The list has opened a folder and passes the key on, which would close the dialog.
     const bool isEnter = event->key() == Qt::Key_Enter || event->key() == Qt::Key_Return;
     if (!isEnter || !m_pkFolders->hasFocus())
         QDialog::keyPressEvent(event);
@@ -218,7 +218,7 @@ void CSelectFolderDialog::accept()
         RunMessageBox(this, title, ToUtf8(DialogText("Invalid Folder")), EButtons::OK);
         return;
     }
-    // The answer has never made a difference: the caller finds that there is nothing in the folder.
+    // The answer makes no difference, and never has: the caller finds nothing in the folder.
     if (!FolderExists(*folder))
         RunMessageBox(this, title,
                       std::string(FolderName(*folder)) + "\n\n" +

@@ -12,18 +12,19 @@ class QToolButton;
 
 namespace gw {
 
-/// The folder chooser. It lists the folders in the one that is open, and with a filter, greyed, the files
-/// that it would take; the path of the open folder can be written over.
+/// The folder chooser. It lists the subfolders of the open folder and, with a filter, the matching files in
+/// gray. The path can be edited.
 class CSelectFolderDialog : public QDialog
 {
 public:
-    /// An empty filter shows none. An initial folder that there is not is that of the user's documents.
+    /// An empty filter shows no files. If the initial folder does not exist, the user's documents folder is
+    /// opened.
     CSelectFolderDialog(QWidget* owner, const FileDialogSetup& setup);
 
-    /// What was chosen, once the dialog has ended with OK.
+    /// Returns the choice, after the dialog has ended with OK.
     FolderChoice Choice() const;
 
-    /// Takes the text: asks about a folder that there is not, and takes it whatever the answer.
+    /// Accepts the text. Asks about a folder that does not exist, and accepts it whatever the answer.
     void accept() override;
 
 protected:
@@ -46,7 +47,7 @@ private:
     std::string m_kFolder;
 };
 
-/// Asks for a folder; nothing when the dialog was cancelled.
+/// Asks for a folder. Returns nothing if the dialog was canceled.
 std::optional<FolderChoice> AskFolder(QWidget* owner, const FileDialogSetup& setup);
 
 } // namespace gw

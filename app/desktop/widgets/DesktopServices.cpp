@@ -14,7 +14,7 @@ namespace gw {
 
 namespace {
 
-// A file manager may have to be started before it answers. Nobody waits for it meanwhile.
+// A file manager may have to start before it replies. The program does not wait for it.
 constexpr int kFileManagerMilliseconds = 5000;
 
 QDBusMessage ShowItems(const QString& url)
@@ -22,7 +22,7 @@ QDBusMessage ShowItems(const QString& url)
     const QString name = QStringLiteral("org.freedesktop.FileManager1");
     QDBusMessage call = QDBusMessage::createMethodCall(name, QStringLiteral("/org/freedesktop/FileManager1"),
                                                        name, QStringLiteral("ShowItems"));
-    call << QStringList(url) << QString(); // the second one is for the desktop's start feedback
+    call << QStringList(url) << QString(); // the second one is for the desktop's startup notification
     return call;
 }
 

@@ -4,15 +4,14 @@
 
 namespace gw {
 
-// What the desktop around the program shows in programs of its own. None of these waits for them.
+// Opens things in other programs of the desktop. None of these functions waits for them.
 
-/// Shows a file in its folder: selected, where the desktop has a file manager that can, else the folder
-/// alone.
+/// Shows a file in its folder, selected if the file manager supports that.
 void ShowInFileManager(const std::string& path);
-/// Opens a help file. The topic that may stand behind its path, after "::", is left to the reader: desktops
-/// have no common way to tell a viewer.
+/// Opens a help file. A topic after its path ("::topic") is ignored, because desktops have no common way to
+/// pass one to a viewer.
 void OpenHelpFile(const std::string& path);
-/// Opens an address. False where the desktop has nothing to open it with.
+/// Opens an address. Returns false if the desktop has no program for it.
 bool OpenWebPage(const std::string& address);
 
 } // namespace gw

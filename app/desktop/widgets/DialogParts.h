@@ -4,14 +4,13 @@
 
 namespace gw {
 
-// What all dialogs share, so that they look like one program. Lengths are the toolkit's own pixels, which
-// follow the scale of the screen.
+// Properties that all dialogs share, so that they look the same. Lengths are device-independent pixels.
 
 inline constexpr int kDialogMargin = 16;
 inline constexpr int kDialogSpacing = 8;
-inline constexpr int kButtonWidth = 84; ///< at least
+inline constexpr int kButtonWidth = 84; ///< minimum
 
-/// Names a widget for scripts and tests, and for those who cannot see it. Answers the widget.
+/// Names a widget for scripts, tests and accessibility. Returns the widget.
 template <class Widget>
 Widget* Named(Widget* widget, const char* name, const QString& accessibleName)
 {

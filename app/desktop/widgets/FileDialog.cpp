@@ -7,7 +7,7 @@ namespace gw {
 
 namespace {
 
-// The text as it stands, and behind it the patterns in brackets, which the dialog hides.
+// The text followed by the patterns in brackets, which the dialog hides.
 QStringList NameFilters(const std::string& filter)
 {
     QStringList names;

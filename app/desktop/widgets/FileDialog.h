@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// Runs the toolkit's own file dialog over a window. None when it was cancelled.
+/// Runs the toolkit's file dialog over a window. Returns nothing if it was canceled.
 std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode mode,
                                          const FileDialogSetup& setup);
 

@@ -14,7 +14,7 @@ namespace gw {
 
 namespace {
 
-constexpr int kKeyCount = 256; // as many as the server's answer has bits
+constexpr int kKeyCount = 256; // number of bits in the server's reply
 
 std::set<EKey> HeldLeftKeys(Display* display)
 {

@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// The left modifier keys that are down on the keyboard, also while another program has it. Empty on systems
-/// that do not reveal this; the application must exist.
+/// Returns the left modifier keys that are down, even while another program has the keyboard. Empty on
+/// systems that do not provide this. The application must exist.
 std::set<EKey> HeldLeftKeys();
 
 } // namespace gw

@@ -6,25 +6,25 @@
 
 namespace gw {
 
-// What a later start says to the first instance: four letters, the number of bytes that follow in four bytes,
-// the lowest first, and the path of a file in UTF-8, or nothing.
+// The message from a later start to the first instance: four letters, the number of following bytes (4 bytes,
+// lowest first), and a file path in UTF-8, which can be empty.
 
 inline constexpr qsizetype kMessageHead = 8;    ///< bytes before the path
-inline constexpr qsizetype kLongestPath = 4096; ///< bytes; no file has a longer one
-inline constexpr char kMessageAnswer = '!';     ///< what the first instance says when it has understood
+inline constexpr qsizetype kLongestPath = 4096; ///< in bytes; no file has a longer path
+inline constexpr char kMessageAnswer = '!';     ///< the first instance's reply to a valid message
 
-/// How far a message has come.
+/// The state of a message being received.
 enum class EMessageState : uint8_t
 {
-    Partial, ///< more may come
+    Partial, ///< more may follow
     Whole,
-    Wrong, ///< nothing of this program
+    Wrong, ///< not from this program
 };
 
-/// The message that hands over a path. One that no file can have is left out.
+/// Returns the message with a path. A path longer than any file's is left out.
 QByteArray MakeMessage(const std::string& path);
 
-/// Reads what has arrived so far; only a whole message sets the path.
+/// Parses the bytes received so far. Sets `path` only if the message is complete.
 EMessageState ReadMessage(const QByteArray& bytes, std::string& path);
 
 } // namespace gw

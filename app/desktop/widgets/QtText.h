@@ -6,7 +6,7 @@
 
 namespace gw {
 
-// Below the windows every text is UTF-8.
+// All text below the windows is UTF-8.
 
 inline QString ToQString(std::string_view text)
 {

@@ -22,15 +22,15 @@ namespace {
 
 int g_signalPipe[2] = {-1, -1};
 
-// A handler may do next to nothing: the loop of events learns of the signal by a byte.
+// A handler can do almost nothing, so it sends a byte that wakes the event loop.
 void Note(int)
 {
     const char byte = 0;
     [[maybe_unused]] const ssize_t written = ::write(g_signalPipe[0], &byte, 1);
 }
 
-// A byte that stays would call this again and again. Quitting closes the open dialogs, but does nothing until
-// the application's own loop runs; until then, a dialog has a loop of its own.
+// The byte must be read, or this would be called again and again. Quitting closes open dialogs but has no
+// other effect until the application's own loop runs; until then, a dialog runs its own loop.
 void Quit()
 {
     char byte = 0;

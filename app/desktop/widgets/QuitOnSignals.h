@@ -4,8 +4,8 @@ class QObject;
 
 namespace gw {
 
-/// From now on, a signal that asks the program to end (from the terminal, or at shutdown) closes its windows
-/// and ends its event loop, so that what it shares with other programs is released. To be called once; the
+/// Makes signals that ask the program to end (from the terminal, or at shutdown) close its windows and end
+/// its event loop, so that everything it shares with other programs is released. Call it once; the
 /// application must outlive the parent.
 void QuitOnSignals(QObject* parent);
 

@@ -13,16 +13,16 @@ namespace gw {
 
 namespace {
 
-constexpr int kHeadHeight = 30; // pixels that a mouse must reach to move a window
+constexpr int kHeadHeight = 30; // pixels that must be reachable to move a window with the mouse
 
-// In 64 bits, since a setting may hold any numbers.
+// In 64 bits, because a setting can contain any numbers.
 bool HasSize(const WindowPlacement& placement, const QSize& size)
 {
     return int64_t{placement.right} - placement.left == size.width() &&
            int64_t{placement.bottom} - placement.top == size.height();
 }
 
-// Whether the middle of the window's head is on a screen.
+// Returns whether the middle of the window's title bar is on a screen.
 bool IsReachable(const WindowPlacement& placement)
 {
     const int64_t middle = (int64_t{placement.left} + placement.right) / 2;
@@ -50,7 +50,8 @@ void WriteWindowPlace(CPlatform& platform, const std::string& setting, const QWi
     if (window.isMinimized() || window.isMaximized())
         return;
     WindowPlacement placement;
-    placement.minimisedX = placement.minimisedY = placement.maximisedX = placement.maximisedY = -1; // none
+    // not used
+    placement.minimisedX = placement.minimisedY = placement.maximisedX = placement.maximisedY = -1;
     placement.left = window.x();
     placement.top = window.y();
     placement.right = window.x() + window.width();

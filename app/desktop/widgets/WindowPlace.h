@@ -11,11 +11,11 @@ namespace gw {
 
 class CPlatform;
 
-/// Where a setting says that a window stood, if that place is on a screen and, unless the size is empty, the
-/// window had this size there.
+/// Returns a window's stored position, if it is on a screen and, unless `size` is empty, was stored with that
+/// size.
 std::optional<QPoint> ReadWindowPlace(const CPlatform& platform, const std::string& setting,
                                       const QSize& size = {});
-/// Keeps where a window stands, unless it is minimised or maximised.
+/// Stores a window's position, unless it is minimized or maximized.
 void WriteWindowPlace(CPlatform& platform, const std::string& setting, const QWidget& window);
 
 } // namespace gw

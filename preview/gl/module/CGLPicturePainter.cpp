@@ -24,7 +24,7 @@ private:
 
 bool CGLPicturePainter::Begin(int width, int height)
 {
-    context_.reset(); // before another one is current
+    context_.reset(); // before another one becomes current
     if (!context_.emplace().Create(width, height))
         return false;
     InitGL();

@@ -1,3 +1,9 @@
+// LZW decoding. The table starts with all single pixels, a clear code and an end code. Each code stands for a
+// string of pixels and adds one entry: the previous string plus the first pixel of the current one. Entries
+// are stored as a link to an older entry plus a last pixel, so a chain always ends, and its known length lets
+// a string be written from back to front. A code beyond the next entry is invalid. Output is limited to the
+// image's pixels, so a few bytes cannot fill the memory.
+
 #include "CLZWDecoder.h"
 
 namespace gw {

@@ -49,8 +49,9 @@ const StreamRow* FindStream(const std::string& path)
     return found == std::end(kStreams) ? nullptr : found;
 }
 
-// The answer of a stream's operation, whatever it throws: its one exception comes with a reason in the
-// record. Sizes are bounded by those of the file or of the trees; a machine may still have less memory.
+// Returns the result of a stream's operation and turns exceptions into failures. ERROBJ comes with a reason
+// in the record. Memory use is bounded by the size of the file or the trees, but a machine may still have
+// less.
 template <class F>
 bool AnswerOf(CFailureRecord& record, F operation)
 {
@@ -95,7 +96,7 @@ bool CMotionFile::Load(const std::string& path)
         m_kRecord = stream->m_kRecord;
         if (!stream->IsSourceWhole())
         {
-            m_kRecord.Clear(); // of what the missing bytes looked like
+            m_kRecord.Clear(); // discard failures caused by the missing bytes
             return m_kRecord.Fail(EFailure::Changed);
         }
         if (!loaded)

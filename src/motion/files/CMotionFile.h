@@ -13,35 +13,34 @@ namespace gw {
 class CLineWriter;
 class TKHTRStream;
 
-/// The one door through which motions are loaded and saved, and the base class of the streams behind it. A
-/// loaded motion is a tree of nodes with one track and one bone mesh each; frame f is reached at time f /
-/// GetFrequency().
+/// Loads and saves motions of all formats, and is the base class of the format streams. A loaded motion is a
+/// tree of nodes with one track and one bone mesh each. Frame f is at time f / GetFrequency().
 class CMotionFile
 {
 public:
     CMotionFile();
-    /// Shares the other's trees and version, for a writer.
+    /// Shares the other file's trees and version, for a writer.
     CMotionFile(const CMotionFile& trees);
     CMotionFile& operator=(const CMotionFile&) = delete;
     virtual ~CMotionFile();
 
-    /// Chooses a stream by the extension without regard to case, and takes its trees over on success; on
-    /// failure the trees stay as they were. Another extension is true where a motion is held already, else
-    /// false. Leaves the tree evaluated at time 0.
+    /// Selects a stream by extension, ignoring case, and takes its trees on success; on failure the trees are
+    /// unchanged. For any other extension, returns true if a motion is already loaded, otherwise false. The
+    /// tree is left at time 0.
     virtual bool Load(const std::string& path);
-    /// Writes an HTR file with frameScale times as many frames; false for every other extension and for
-    /// failures.
+    /// Writes an HTR file with frameScale times as many frames. Returns false for other extensions and on
+    /// failure.
     virtual bool Save(const std::string& path, float frameScale);
-    /// Hands the text of that HTR file to a sink, in pieces.
+    /// Sends the text of that HTR file to a sink, in pieces.
     virtual bool SaveText(const CByteSink& sink, float frameScale);
 
-    /// The end time of the first control, in frames, or 0.
+    /// End time of the first control in frames, or 0.
     float GetLastFrame() const;
-    /// The frame time in seconds of the first control, or 0.
+    /// Frame time of the first control in seconds, or 0.
     float GetFrequency() const;
-    /// The number of key times of the first track, or 0.
+    /// Number of key times of the first track, or 0.
     int GetKeyCount() const;
-    /// What the last Load or Save failed on or warned of.
+    /// Failure and warnings of the last Load or Save.
     const CFailureRecord& Record() const { return m_kRecord; }
 
     Ref<CNode> restRoot;   ///< the rest pose, without controls; HTR files only
@@ -49,15 +48,15 @@ public:
     int fileVersion = 1;
 
 protected:
-    /// Maps a text file and rewinds. False for an empty path or a file that cannot be read.
+    /// Maps a text file and rewinds. Returns false for an empty path or a file that cannot be read.
     bool ReadLines(const std::string& path);
-    /// Replaces a file by the lines that `append` writes, in one step. False for an empty path, for a file
-    /// that cannot be written, and where `append` gives up; the old file stands then.
+    /// Replaces a file atomically with the lines that `append` writes. Returns false for an empty path, if
+    /// writing fails, and if `append` returns false; the old file is then unchanged.
     bool WriteLines(const std::string& path, const std::function<bool(CLineWriter&)>& append);
-    /// Hands such lines to a sink. False where it refuses any or `append` gives up.
+    /// Sends such lines to a sink. Returns false if the sink refuses any or `append` returns false.
     bool WriteLines(const CByteSink& sink, const std::function<bool(CLineWriter&)>& append);
 
-    /// Whether the source still had all its bytes when Load was done with it.
+    /// Returns false if the source was truncated during Load.
     virtual bool IsSourceWhole() const { return lines.IsWhole(); }
 
     CTextLines lines; ///< the text being read
@@ -67,7 +66,7 @@ private:
     bool SaveBy(const std::function<bool(TKHTRStream&)>& save);
 };
 
-/// Switches every control under a node on or off. Switched off, a track gives its node the rest pose.
+/// Activates or deactivates every control below a node. An inactive track sets its node to the rest pose.
 void SwitchControls(CNode& root, bool active);
 
 } // namespace gw

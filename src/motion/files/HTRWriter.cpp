@@ -1,8 +1,9 @@
 // The writing half of TKHTRStream.
 //
-// A file lists all rows of one segment before those of the next. Where a node's local matrix follows from its
-// own track alone, segments are sampled one after the other and go straight into the file, so that nothing is
-// kept. In any other tree all nodes must be posed for a frame at once, and the rows wait for their turn.
+// A file lists all rows of one segment before those of the next. If each node's local matrix depends only on
+// its own track, segments are sampled one after another and written immediately, without storing rows. In any
+// other tree, all nodes must be posed together for each frame, and the rows are kept until their segment is
+// written.
 
 #include "BoneMeshQueries.h"
 #include "CHTRRowText.h"
@@ -23,11 +24,11 @@ namespace gw {
 
 namespace {
 
-constexpr float kFrameLimit = 1 << 24;             // frame numbers beyond are no whole floats
-constexpr size_t kRowBytesLimit = size_t{1} << 31; // of rows that wait
+constexpr float kFrameLimit = 1 << 24;             // larger frame numbers are not exact in a float
+constexpr size_t kRowBytesLimit = size_t{1} << 31; // for stored rows
 constexpr size_t kNoNode = std::numeric_limits<size_t>::max();
 
-// Only the root carries its translation.
+// Only the root has a translation.
 HTRRow RowOf(const Mat4& local, bool isRoot, const TKHTRSegment& segment)
 {
     const double length = Vec3Length(local.Row(0));
@@ -54,7 +55,8 @@ void AddSegments(const CNode& node, std::string_view parentName, TKHTRFile& file
     }
 }
 
-// For each segment the node of its name in the animated tree, or kNoNode. Equal names go in order.
+// For each segment, the index of the animated node with its name, or kNoNode. Equal names are matched in
+// order.
 std::vector<size_t> NodesOfSegments(const TKHTRFile& file, const std::vector<CNode*>& nodes)
 {
     std::unordered_map<std::string_view, std::vector<size_t>> nodesOfName;
@@ -79,7 +81,7 @@ std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
     return times;
 }
 
-/// The rows of all segments, computed as they are written or, if they depend on each other, beforehand.
+/// The rows of all segments, computed while writing or, if nodes depend on each other, in advance.
 class CRows
 {
 public:
@@ -89,7 +91,7 @@ public:
     {
     }
 
-    /// False where the rows that must wait would take too much memory.
+    /// Returns false if storing the rows would take too much memory.
     bool Prepare()
     {
         if (m_kSampler.PosesNodes())
@@ -121,7 +123,7 @@ public:
 private:
     static int NumberOf(size_t frame) { return static_cast<int>(frame) + 1; }
 
-    // The usual case: nearly all of a save is spent here.
+    // The usual case. Nearly all of the time of a save is spent here.
     void WriteSampled(CLineWriter& out, size_t segment, const CKeyframeControl& track) const
     {
         const bool isRoot = !m_kSampler.Nodes()[m_kNodeOfSegment[segment]]->GetParent();
@@ -158,7 +160,7 @@ private:
     std::vector<float> m_kTimes;
     CMotionSampler m_kSampler;
     std::vector<size_t> m_kNodeOfSegment;
-    std::vector<HTRRow> m_kWaiting; // segment by segment
+    std::vector<HTRRow> m_kWaiting; // ordered by segment
 };
 
 void Write(CLineWriter& out, const TKHTRFile& file, const HTRText& field)
@@ -229,7 +231,7 @@ void WriteRows(CLineWriter& out, const TKHTRFile& file, CRows& rows)
 
 bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
 {
-    // One rounding: of the exact product to 32 bits.
+    // Rounded once, from the exact product to 32 bits.
     const auto frames =
         static_cast<float>(static_cast<double>(GetKeyCount()) * static_cast<double>(frameScale));
     const double rate = 1.0 / static_cast<double>(GetFrequency());

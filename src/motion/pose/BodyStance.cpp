@@ -1,5 +1,5 @@
-// A body is judged by its own axes and by directions between joints alone: which way is up in the world, how
-// a file turns its bones and how long they are says nothing about how somebody stands.
+// Judges a rest pose only by the body's own axes and the directions between joints. The world's up axis, the
+// orientation of the bones and their lengths differ between files and say nothing about the stance.
 
 #include "BodyStance.h"
 
@@ -13,15 +13,15 @@ namespace gw {
 
 namespace {
 
-// Degrees. In T-poses of real files an arm is 6 off the line through both shoulders at most, in all other
-// rest poses 43 or more.
+// Degrees. In T-poses of real files, an arm is at most 6 off the shoulder line; in all other rest poses, at
+// least 43.
 constexpr double kMostOfTPose = 32.0;
 constexpr double kMostOfAPose = 65.0;
 constexpr double kMostOfArmsDown = 30.0;
-// Legs that are spread are 20 off; in rest poses that nobody stands in they lie along the trunk.
+// Spread legs are up to 20 off; in rest poses that are not stances, legs lie along the trunk.
 constexpr double kMostOfStance = 45.0;
 
-// A point is sooner taken up the tree than a matrix.
+// Transforms a point up the tree, which is cheaper than multiplying matrices.
 Vec3 RestPlace(const CNode& joint)
 {
     Vec3 place = RestLocal(joint).Translation();
@@ -47,7 +47,7 @@ Angle Larger(const Ways& ways, const Vec3& left, const Vec3& right)
     return a && b ? std::max(a, b) : std::nullopt;
 }
 
-// A toe below the ankle or missing says nothing.
+// The angle of a foot from `forward`. 0 if the toe is missing or below the ankle.
 double FootOff(const Vec3& foot, const BodyStance& stance)
 {
     constexpr double kAhead = 0.5; // sine of the angle from the trunk

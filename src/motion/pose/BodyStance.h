@@ -10,47 +10,47 @@
 
 namespace gw {
 
-/// How a body stands in a pose.
+/// The kind of a body's pose at rest.
 enum class ERestPose : uint8_t
 {
     Unknown, ///< the arms were not found
-    None,    ///< no stance at all: a leg does not point away from the trunk
+    None,    ///< not a standing pose: a leg does not point away from the trunk
     TPose,
     APose,
     ArmsDown,
-    Other, ///< a stance, with the arms somewhere else
+    Other, ///< a standing pose with the arms in another position
 };
 
-/// What a body's joints say of a pose. Angles are in degrees, of two limbs the larger one; no value where
-/// joints are missing.
+/// Measurements of a pose. Angles are degrees; for a pair of limbs, the larger angle. Empty if joints are
+/// missing.
 struct BodyStance
 {
-    Vec3 up;                         ///< from the hip to the head, else to the chest; zero if not known
-    Vec3 left;                       ///< along the thighs' line, square to `up`
+    Vec3 up;                         ///< from the hip to the head, or to the chest; zero if unknown
+    Vec3 left;                       ///< along the line between the thighs, perpendicular to `up`
     Vec3 forward;                    ///< left x up
-    std::optional<double> thighs;    ///< from straight down along the trunk
-    std::optional<double> apart;     ///< between the thighs
-    std::optional<double> shins;     ///< the same
-    std::optional<double> shoulders; ///< the upper arms' line from that of the thighs
-    double feet = 0.0;               ///< toes that lie ahead, from `forward`; 0 if none does
-    std::optional<double> armsSide;  ///< from the line through both upper arms, outward
-    std::optional<double> armsDown;  ///< from straight down along the trunk
+    std::optional<double> thighs;    ///< thighs against straight down along the trunk
+    std::optional<double> apart;     ///< angle between the thighs
+    std::optional<double> shins;     ///< shins against straight down along the trunk
+    std::optional<double> shoulders; ///< line of the upper arms against that of the thighs
+    double feet = 0.0;               ///< toes against `forward`, if they point ahead; otherwise 0
+    std::optional<double> armsSide;  ///< arms against the line through both upper arms, outward
+    std::optional<double> armsDown;  ///< arms against straight down along the trunk
 
-    /// What it is, by the figures. Without legs it cannot be None, nor ArmsDown without a trunk.
+    /// Classifies the pose. Without legs the result is never None; without a trunk it is never ArmsDown.
     ERestPose Verdict() const;
-    /// Whether a body could stand so, wherever its arms are.
+    /// Whether the legs are those of a standing body, wherever its arms are.
     bool Stands() const;
 };
 
-/// Where a joint is in a pose, world space.
+/// Returns a joint's world position in a pose.
 using JointPlaces = std::function<Vec3(const CNode&)>;
 
-/// The stance of a body whose joints are at these places.
+/// Measures a body whose joints are at the given positions.
 BodyStance StanceOf(const CBodyMap& body, const JointPlaces& places);
-/// The stance in the rest pose of the body's tree, which need not be posed so.
+/// Measures the rest pose of the body's tree, whatever its current pose.
 BodyStance RestStanceOf(const CBodyMap& body);
 
-/// "T-pose"; "unknown" where it is.
+/// The pose's name, such as "T-pose" or "unknown".
 std::string_view RestPoseName(ERestPose pose);
 
 } // namespace gw

@@ -1,3 +1,6 @@
+// Samples the rest pose and up to 16 frames at equal distances, fewer for very large skeletons, so that
+// memory is bounded. The tree is posed in place and restored afterwards.
+
 #include "CStances.h"
 
 #include "BoneMeshQueries.h"

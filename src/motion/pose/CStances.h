@@ -13,8 +13,8 @@ namespace gw {
 class CNode;
 
 /// The joint positions of a skeleton in its rest pose and in some frames spread over its motion. Many files
-/// have rest poses in which nobody could stand, so a body is judged over several poses. The tree is posed
-/// during construction and left as it was.
+/// have rest poses that are not standing poses, so a body is judged in several poses. The constructor poses
+/// the tree and restores it.
 class CStances
 {
 public:

@@ -10,8 +10,8 @@
 
 namespace gw {
 
-/// Mean and largest value of numbers that come one by one. Both are 0 where none came. What is no finite
-/// number, as positions near the end of 32 bits give, is passed over.
+/// Mean and maximum of a sequence of numbers; both are 0 for an empty one. Infinities and NaN, as they result
+/// from positions near the limits of a float, are ignored.
 class CRunningMean
 {
 public:
@@ -34,18 +34,18 @@ private:
     size_t m_uiCount = 0;
 };
 
-/// result / source, or nothing where the source's figure is not above `least`, which is what rounding can
+/// result / source; empty if the source's value is not above `least`, the largest value that rounding can
 /// make of 0.
 inline std::optional<double> RatioOf(double result, double source, double least = 0.0)
 {
     return source > least ? std::optional(result / source) : std::nullopt;
 }
 
-/// The value below which a share (0 to 1) of the values lies, by the nearest rank; 0 without values. Numbers
-/// that are not finite do not count.
+/// The nearest-rank percentile: the value below which a share (0 to 1) of the values lies. 0 if there are no
+/// values. Values that are not finite are ignored.
 float Percentile(std::vector<float> values, double share);
 
-/// The distance of two points over the ground: in x and z alone.
+/// The horizontal distance of two points: in x and z only.
 double GroundDistance(const Vec3& a, const Vec3& b);
 
 } // namespace gw

@@ -7,11 +7,11 @@
 
 namespace gw {
 
-/// One limb solver for each leg.
+/// One limb solver per leg.
 class CLegSolver
 {
 public:
-    /// The rotations that bring a limb's end to its goal, in the solver's frame.
+    /// The rotations that move a limb's end to its goal, in the solver's frame.
     struct Pose
     {
         Mat3 hip;
@@ -21,9 +21,11 @@ public:
 
     explicit CLegSolver(size_t legCount) : chains(legCount) {}
 
-    /// The segments of leg k in the bones' frame, the hinge's axis and the projection axis in the solver's.
+    /// Sets up leg k: its segments in the bones' frame, the hinge axis and the projection axis in the
+    /// solver's frame.
     void SetLimb(size_t k, const Vec3& upper, const Vec3& lower, const Vec3& axis, const Vec3& projection);
-    /// False where the goal cannot be reached by any knee angle. The hint is moved onto the knee's circle.
+    /// Solves leg k for a goal. Returns false if no knee angle reaches it. The hint is moved onto the knee's
+    /// circle.
     bool Solve(size_t k, Vec3& hint, const Mat4& goal, Pose& pose);
 
 private:

@@ -1,3 +1,37 @@
+// Closed-form inverse kinematics for one limb.
+//
+// The problem: given the hip at the origin, an upper segment, a lower segment and a goal (position and
+// rotation) for the ankle, find the rotations of hip, knee and ankle. The ankle has to reach six coordinates
+// and the joints have seven degrees of freedom (3 + 1 + 3), so one of them is free: the limb can swivel
+// around the line from hip to goal without moving the ankle. The caller fixes it with a hint, a point that
+// the knee should be close to.
+//
+// The idea, in four steps:
+// 1. ClampGoal. If the goal is farther away than the limb is long, it is moved toward the hip until it is
+//    just within reach.
+// 2. SolveKnee. The distance from hip to ankle depends only on the knee angle x. With row vectors it is |s ·
+//    Ry(x) · U + t|, where s and t are the lower and the upper segment and U is the rotation of the upper
+//    one. Squared, this becomes a cos x + b sin x = c, with two solutions around atan2(b, a). The first one
+//    that is not negative is used.
+// 3. Circle. The possible knee positions are the intersection of two spheres: around the hip with the upper
+//    length, around the goal with the lower length. This is a circle about the line to the goal; the law of
+//    cosines gives its center and radius. The hinge axis, projected onto the circle's plane, is at angle 0,
+//    and the projection axis decides the direction of rotation. The hint selects the nearest point on the
+//    circle.
+// 4. SolveAtAngle. The hip rotation maps one frame onto another. In the limb's own pose, the frame is the
+//    direction of the knee and the part of the ankle's position perpendicular to it. At the goal, it is the
+//    chosen knee and the part of the goal's position perpendicular to that. The ankle's rotation is what is
+//    then missing from the goal's rotation.
+//
+// Why it ends: there is no iteration; every step is a fixed number of operations. It fails if no knee angle
+// of at least 0 reaches the goal, for example because the goal is closer than the difference of the segment
+// lengths, or if joints coincide.
+//
+// The numbers guard against rounding of 32-bit inputs: a clamped goal stays one part in 100,000 short of full
+// length, where knee and circle are still well defined; a cosine may exceed 1 by a millionth; and a
+// perpendicular part shorter than a millionth of its vector has no usable direction. Straight limbs then use
+// the limit of a vanishing bend.
+
 #include "CLimbChain.h"
 
 #include "Directions.h"
@@ -9,11 +43,11 @@ namespace gw {
 
 namespace {
 
-// A goal out of reach is drawn in to just short of the full length.
+// A goal that is out of reach is moved to just short of the full length.
 constexpr double kReachSlack = 1.00001;
-// A cosine this little beyond 1 is rounding: the limb is straight.
+// A cosine may exceed 1 by this much because of rounding: the limb is straight.
 constexpr double kCosineRounding = 1e-6;
-// Below this share of its length a vector's part across an axis is rounding and has no direction.
+// If the part of a vector across an axis is shorter than this share of its length, it is rounding noise.
 constexpr double kStraight = 1e-6;
 
 bool HasDirection(const Vec3& across, const Vec3& whole)
@@ -33,8 +67,7 @@ Mat3 RotationOf(const Mat4& m)
     return Rows(m.Row(0), m.Row(1), m.Row(2));
 }
 
-// The solutions of a cos x + b sin x = c, of which one that is not negative is wanted, the first before the
-// second.
+// Solves a cos x + b sin x = c. Of the two solutions, returns the first one that is not negative.
 bool FirstAngleNotNegative(double a, double b, double c, double& angle)
 {
     const double amplitude = std::hypot(a, b);
@@ -147,8 +180,8 @@ bool CLimbChain::SolveAtAngle(float angle, Mat3& hip, Mat3& ankle) const
 {
     const Vec3 a = upperPosition * upperLengthInverse;
     Vec3 b = Across(chainPosition, a);
-    // A straight limb is the limit of a vanishing bend: the shank leaves the thigh's line against X, and the
-    // ankle lies on the other side of the line than the knee.
+    // A straight limb is treated as the limit of a vanishing bend: the lower segment turns toward -X, and the
+    // ankle is on the other side of the line than the knee.
     if (!HasDirection(b, chainPosition))
         b = Across(-kVec3UnitX, a);
     b = Vec3Normalized(b);

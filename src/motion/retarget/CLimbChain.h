@@ -4,31 +4,31 @@
 
 namespace gw {
 
-/// A limb of three joints solved in closed form: a ball at the hip, a hinge at the knee, a ball at the ankle.
-/// All in the solver's frame, which is the bones' frame turned by AxisSwapForward, with the hip at the
-/// origin. Radians.
+/// Solves a limb of three joints in closed form: a ball joint at the hip, a hinge at the knee, a ball joint
+/// at the ankle. All values are in the solver's frame, which is the bones' frame rotated by AxisSwapForward,
+/// with the hip at the origin. Angles are radians.
 class CLimbChain
 {
 public:
-    /// The upper and lower segment (only their translations matter), the hinge's axis, and the axis that
-    /// tells which way round the knee's circle runs.
+    /// Sets the upper and lower segment (only their translations matter), the hinge axis, and the axis that
+    /// defines the direction of the knee's circle.
     void Init(const Mat4& upper, const Mat4& lower, const Vec3& axis, const Vec3& projection);
-    /// Takes the goal of the limb's end, drawn in where it is out of reach, and finds the knee's circle and
-    /// angle. False where no knee angle reaches it.
+    /// Sets the goal of the limb's end, moved closer if it is out of reach, and computes the knee's circle
+    /// and angle. Returns false if no knee angle reaches it.
     bool SetGoal(const Mat4& newGoal);
-    /// The angle on the knee's circle that is nearest to a point.
+    /// The angle of the point on the knee's circle that is nearest to a point.
     float KneeAngleFromHint(const Vec3& hint) const;
-    /// The knee's place at an angle on its circle.
+    /// The knee's position at an angle on its circle.
     Vec3 KneePoint(float angle) const;
-    /// The rotations of hip and ankle with the knee at an angle on its circle. False where they are not
-    /// defined: goal, knee and hip in one point.
+    /// Computes the rotations of hip and ankle for a knee position on the circle. Returns false if they are
+    /// undefined, because goal, knee and hip coincide.
     bool SolveAtAngle(float angle, Mat3& hip, Mat3& ankle) const;
 
     bool clampReach = true;
     float kneeAngle = 0.0f;
 
-    /// Draws a goal that lies farther from the origin than the lengths of `a` and `b` together in to just
-    /// short of that. Returns whether it did.
+    /// If a goal is farther from the origin than the lengths of `a` and `b` together, moves it to just within
+    /// that distance. Returns whether it did.
     static bool ClampGoal(const Vec3& a, const Vec3& b, Vec3& goal);
 
 private:

@@ -1,3 +1,35 @@
+// Posing the target skeleton like the source skeleton, for one frame.
+//
+// The problem: the two skeletons have different bones. Each mapped target bone must end up with the world
+// rotation of its source bone. Between two mapped bones there can be unmapped ones, for example two extra
+// spine bones. If they stayed still, the whole bend would happen in a single joint and the body would look
+// broken, so they take shares of the rotation.
+//
+// The idea: split the target into chains. A chain ends at a mapped bone and begins below the nearest mapped
+// ancestor, or below a bone that is marked as fixed. It is posed from the top down. Each bone computes the
+// rotation that is still missing, relative to its parent's current world matrix, and takes its part of it
+// (SharedRotation). The last bone takes everything that is left, so it reaches the source's rotation. The
+// user's offsets are applied on top.
+//
+// What the shares mean: the missing rotation is decomposed as Ra · Rb · Rc about three axes, selected by the
+// bone's type. A link has two shares, which are running totals of the bones' weights and reach 1 at the end
+// of the chain. `curve` scales the first rotation Ra; it follows a quarter of a sine wave, so the upper bones
+// take more of it. `fraction` is the position of the slerp from the scaled Ra to the whole rotation. Bones
+// without an entry in the share file have the weight log(1 + length), so long bones take more.
+//
+// Why it ends: chains are planned once, by walking up parent links, which end at the root. A pose is one loop
+// over the chains and their links, without recursion, search or allocation. If two chains share a bone, the
+// later one poses it again.
+//
+// Three peculiarities decide the bits of the result and must stay: scaled quaternions are not normalized, so
+// a bone with a partial share can have a sheared world matrix; a bone with the whole share still goes through
+// the decomposition if that does not reproduce the rotation (at exact quarter turns, see SafeAsin) or if its
+// rows are not perpendicular; and the sine curve ends at 1.570795 rather than at pi / 2. SetPlainTurns turns
+// off the second one for quarter turns.
+//
+// A chain without a mapped ancestor is free: its translations follow the source too, each bone at the tip of
+// its parent's mesh. In all other chains, bones keep their own translation.
+
 #include "CPoseMatcher.h"
 
 #include "Angles.h"
@@ -12,13 +44,13 @@ namespace gw {
 
 namespace {
 
-// A quarter turn as the sine curve of the shares has it: this decimal number, not the machine's pi / 2.
+// End of the quarter sine wave for the shares: exactly this decimal number, not pi / 2.
 constexpr float kCurveEnd = 1.570795f;
-// Sums of shares are equal but for rounding.
+// Tolerance for the rounding of summed shares.
 constexpr float kWhole = 1e-6f;
 
-// M = Ra · Rb · Rc: which Euler order gives the angles, which axes the three rotations have, and which matrix
-// element is the sine of the middle one.
+// M = Ra · Rb · Rc: the Euler order that yields the angles, the axes of the three rotations, and the matrix
+// element that is the sine of the middle angle.
 struct Decomposition
 {
     EEulerOrder order;
@@ -44,8 +76,8 @@ Mat3 AboutAxis(int axis, float angle)
     return Mat3FromAxisAngle(axes[axis], angle);
 }
 
-// The part of a rotation that a bone of a chain takes: `curve` of the first rotation of its decomposition,
-// and of the way from there to everything `fraction`. Scaled quaternions are not normalised on the way.
+// Returns a bone's part of a rotation: the first rotation of the decomposition scaled by `curve`, then
+// `fraction` of the way from there to the whole rotation. Scaled quaternions are not normalized.
 Mat3 SharedRotation(const Mat3& m, int type, float fraction, float curve)
 {
     const Decomposition& parts = DecompositionOf(type);
@@ -58,14 +90,14 @@ Mat3 SharedRotation(const Mat3& m, int type, float fraction, float curve)
     return QuatToMat3(QuatSlerp(fraction, first, QuatFromMat3(turned)));
 }
 
-// Whether the decomposition gives the rotation back: at the ends of SafeAsin it does not.
+// Whether the decomposition reproduces the rotation. It does not where SafeAsin's ends are swapped.
 bool IsFaithful(const Mat3& m, int type)
 {
     return std::fabs(m.m[DecompositionOf(type).sineElement]) < 1.0f;
 }
 
-// Whether the rows of a matrix, which have unit length, are perpendicular. Below a bone that takes only a
-// share of a rotation they may not be: scaled quaternions shear its world matrix.
+// Whether the unit rows of a matrix are perpendicular. Below a bone with a partial share they may not be,
+// because scaled quaternions shear its world matrix.
 bool IsOrthogonal(const Mat3& m)
 {
     constexpr float kPerpendicular = 1e-6f;
@@ -216,9 +248,8 @@ void CPoseMatcher::MatchPose()
     }
 }
 
-// Hands a source bone's world rotation to the bones of a chain, from the top down. The shares were summed up
-// when the chain was planned, so this needs no recursion and no running totals. `position` is by value: each
-// link without a mapped bone above it changes it for those below.
+// Distributes a source bone's world rotation over the bones of a chain, top down, using the shares summed up
+// at planning. `position` is passed by value: in a free chain, each link changes it for the links below.
 void CPoseMatcher::SpreadRotation(const Chain& chain, const Mat3& rotation, Vec3 position, const Vec3& scale)
 {
     for (const Link& link : chain.links)
@@ -256,8 +287,8 @@ void CPoseMatcher::PoseLink(const Chain& chain, const Link& link, const Mat3& ro
     if (link.turned)
         m = link.offset * m;
 
-    // The world matrix that the bones below see still has the source's scale; the local pose keeps the rest
-    // pose's.
+    // The world matrix used by the bones below keeps the source's scale; the local pose keeps the rest pose's
+    // scale.
     const Mat4 stretched = Mat4Compose(m, bone.translation, RowLengths(local));
     bone.world = bone.parent < 0 ? stretched : stretched * m_kBones[static_cast<size_t>(bone.parent)].world;
     bone.rotation = NormalizedRows(Mat4Compose(m, kVec3Zero));

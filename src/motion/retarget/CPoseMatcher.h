@@ -8,14 +8,13 @@
 
 namespace gw {
 
-/// Poses the target after the source's present world matrices. Which target bones share which source bone's
-/// rotation, in what parts and by which decomposition does not change from frame to frame: it is worked out
-/// once, and a pose is a walk over arrays. Bones stand in the order of the target tree, depth first.
+/// Poses the target like the source's current world matrices. Which target bones share a source bone's
+/// rotation, in which parts and by which decomposition, is the same for all frames. It is planned once, and a
+/// pose is a loop over arrays. Bones are in the order of the target tree, depth first.
 class CPoseMatcher
 {
 public:
-    /// A target bone's local pose: rotation, translation and the row lengths that it has had since the rest
-    /// pose.
+    /// A target bone's local pose: rotation, translation, and the row lengths of the rest pose.
     struct Bone
     {
         CNode* node;
@@ -23,30 +22,30 @@ public:
         Mat3 rotation;
         Vec3 translation;
         Vec3 scale;
-        bool posed; ///< some source bone turns it
-        Mat4 world; ///< while a pose is matched; fresh for the bones that were visited
+        bool posed; ///< driven by a source bone
+        Mat4 world; ///< valid while a pose is matched, for the bones visited so far
     };
 
-    /// Plans for the trees and tables of a retargeter. Both trees stand in rest pose.
+    /// Plans for the trees and tables of a retargeter. Both trees must be in rest pose.
     CPoseMatcher(const CRetargeter& retargeter, CNode& targetRoot);
 
-    /// Turns the target's bones after the source's world matrices: each mapped bone takes its source's world
-    /// rotation, and unmapped bones between two mapped ones take their shares of it.
+    /// Poses the target's bones from the source's world matrices: each mapped bone gets its source's world
+    /// rotation, and unmapped bones between two mapped ones get their shares of it.
     void MatchPose();
-    /// Writes the bones' local poses into their nodes.
+    /// Writes the bones' local poses to their nodes.
     void WriteNodes() const;
-    /// Takes a node's translation back, where something outside has moved it.
+    /// Reads a bone's translation from its node, after other code has moved the node.
     void ReadTranslation(size_t index);
 
     std::vector<Bone>& Bones() { return m_kBones; }
     const std::vector<Bone>& Bones() const { return m_kBones; }
-    /// The bone's local matrix as it stands.
+    /// The bone's current local matrix.
     Mat4 LocalMatrix(size_t index) const;
-    /// Brings a bone's world matrix up to date with its local pose and its parent's world matrix.
+    /// Recomputes a bone's world matrix from its local pose and its parent's world matrix.
     void UpdateWorld(size_t index);
     /// The index of a node's bone, or -1.
     int IndexOf(const CNode* node) const;
-    /// The source nodes whose world matrices a pose reads.
+    /// The source nodes whose world matrices MatchPose reads.
     const std::vector<CNode*>& SourceNodes() const { return m_kSources; }
 
 private:
@@ -54,22 +53,22 @@ private:
     struct Link
     {
         size_t bone;
-        float fraction; ///< what of the whole rotation this bone has taken with those above it
-        float curve;    ///< the same for the rotation that is shared out first, along a sine
+        float fraction; ///< cumulative share of the whole rotation, this bone included
+        float curve;    ///< cumulative share of the first rotation, along a sine
         int type;       ///< decomposition
-        bool whole;     ///< both parts are everything: the bone takes the rotation as it is
-        bool turned;    ///< an offset stands on it
+        bool whole;     ///< both shares are 1: the bone takes the rotation unchanged
+        bool turned;    ///< the bone has an offset
         Mat3 offset;
-        Vec3 parentTip; ///< axis of the parent's bone mesh
+        Vec3 parentTip; ///< bone axis of the parent's mesh
     };
-    /// The bones from below the nearest mapped ancestor, or a fixed one, down to a mapped bone.
+    /// The bones from below the nearest mapped ancestor, or below a fixed bone, down to a mapped bone.
     struct Chain
     {
         const Mat4* sourceWorld;
         bool free; ///< no mapped ancestor: translations follow the source too
         std::vector<Link> links;
         std::vector<size_t>
-            stale; ///< ancestors that no chain visits, top down: their worlds are brought up to date
+            stale; ///< ancestors in no chain, top down; their world matrices are updated first
     };
 
     void PlanChain(const CRetargeter& retargeter, size_t bone, CNode& source, std::vector<bool>& visited);
@@ -84,12 +83,13 @@ private:
     std::vector<CNode*> m_kSources;
 };
 
-/// What an offset of angles in degrees and a matrix does to a bone's rotation M: the result stands left of M.
+/// Rotation of an offset, given as angles in degrees and a matrix. It is multiplied to the left of a bone's
+/// rotation.
 Mat3 OffsetRotation(const Vec3& degrees, const Mat3& matrix);
 
-/// Sets a node's local matrix and changes those of its children by the inverse of the change, so that the
-/// children's world matrices stay. If the new matrix cannot be inverted, the children keep their matrix below
-/// the old one. World matrices follow with the next update.
+/// Sets a node's local matrix and compensates in its children, so that their world matrices stay the same. If
+/// the new matrix is singular, the children are transformed by the old one only. World matrices change with
+/// the next update.
 void SetLocalMatrixKeepChildren(CNode& node, const Mat4& local);
 
 } // namespace gw

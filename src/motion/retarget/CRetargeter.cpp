@@ -16,7 +16,7 @@ constexpr size_t kShareLineLimit = 1023;
 constexpr std::string_view kShareDelimiters = " ,:\n";
 
 // Reads one line of the share file: a bone's name, "Share" with two numbers, "Type" with one, in any order.
-// Values of an earlier line stay where a line does not give its own.
+// Values missing in a line keep those of earlier lines.
 class CShareLine
 {
 public:
@@ -63,7 +63,7 @@ private:
     int m_iCount = 0;
 };
 
-// The first node with exactly this name, else the first one that has it in another case.
+// The first node with exactly this name, otherwise the first one that matches ignoring case.
 CNode* NodeOfName(const std::vector<CNode*>& nodes, std::string_view name)
 {
     const auto has = [=](const CNode* node) { return node->GetName() && node->NameView() == name; };
@@ -107,7 +107,8 @@ bool CRetargeter::LoadShares(const std::string& path)
 {
     CMappedFile file;
     const EFailure failure = file.Open(path);
-    // A skeleton need not have the file; one that is there and cannot be read would be missed in the result.
+    // The file is optional, but one that exists and cannot be read must be reported: its shares would be
+    // missing.
     if (failure != EFailure::None && FileExists(path))
         return m_kRecord.Fail(failure, 0, path);
     if (failure != EFailure::None)

@@ -8,14 +8,14 @@ namespace gw {
 class CNode;
 class CSpatial;
 
-/// Brings the source nodes that a conversion looks at, those above them and their bone meshes to a time, each
-/// once. The rest of the source (fingers, meshes, bounds) is left as it is.
+/// Updates the source nodes that a conversion reads, their ancestors and their bone meshes to a time, each
+/// once. The rest of the source (fingers, other meshes, bounds) is not updated.
 class CSourceSampler
 {
 public:
     CSourceSampler(const CNode* root, const std::vector<CNode*>& wanted);
 
-    /// Looks at more nodes.
+    /// Adds more nodes to update.
     void Add(const std::vector<CNode*>& wanted);
     void Sample(float time) const;
 

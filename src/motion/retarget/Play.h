@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// How far something is led by what goes a way off, with some play between the two.
+/// The part of `way` that lies outside a dead zone of radius `play`.
 inline Vec3 BeyondPlay(const Vec3& way, double play)
 {
     const double distance = Vec3Length(way);

@@ -1,6 +1,6 @@
-// The frame loop. What does not change from frame to frame is planned before it: which source nodes are
-// looked at (CSourceSampler), how the target's bones share their rotations (CPoseMatcher), which bones make a
-// leg (CLegPlanter), and the tracks at their full length. The loop touches arrays and allocates nothing.
+// The frame loop. Everything that is the same for all frames is prepared before it: the source nodes to
+// update (CSourceSampler), the target bones' shares (CPoseMatcher), the bones of the legs (CLegPlanter), and
+// the tracks at full length. The loop itself only works on arrays and allocates nothing.
 
 #include "CFaithfulPose.h"
 #include "CGeometry.h"
@@ -21,19 +21,19 @@ namespace gw {
 namespace {
 
 constexpr float kBodyWeight = 0.45f;
-// Frame numbers are floats, and from here on the next one is the same.
+// Frame numbers are floats; from here on, adding 1 has no effect.
 constexpr float kFrameLimit = 16777216.0f;
-// What the tracks of a result may take: no more than 2 GB, and beyond a size that any machine has, as much as
-// the source's own keys let expect. A container can name any end time without a byte behind it.
+// Limits on the size of the result's tracks: at most 2 GB, and at most a fixed allowance plus a multiple of
+// the source's keys. A container can claim any end time without a single byte of keys.
 constexpr uint64_t kResultBytesLimit = uint64_t{1} << 31;
-constexpr uint64_t kAnyResultBytes = uint64_t{32} << 20; // twenty minutes of the fixed skeleton
+constexpr uint64_t kAnyResultBytes = uint64_t{32} << 20; // about twenty minutes of the fixed skeleton
 constexpr uint64_t kResultBytesPerSourceByte = 4;
 constexpr uint64_t kKeyBytes = sizeof(float) + sizeof(Quat) + 2 * sizeof(Vec3);
 
 constexpr size_t kProgressFrames = 64;
-constexpr float kUsualFrameSeconds = 1.0f / 30.0f; // where a source gives no usable one
+constexpr float kUsualFrameSeconds = 1.0f / 30.0f; // used if the source has no valid frame time
 
-// The bytes of all keys below a node; the times may be claims as well.
+// Size of all keys below a node. Key times are not counted, because they can be mere claims too.
 uint64_t KeyBytesOf(CNode& root)
 {
     std::vector<CObject*> found;
@@ -60,7 +60,7 @@ void RestPose(CNode& root)
     root.UpdateScene(0.0f, true);
 }
 
-// Moves the root up or down so that the lowest point of the skeleton's meshes stands on y = 0.
+// Moves the root vertically until the lowest point of the skeleton's meshes is at y = 0.
 void GroundTarget(CNode& root, float time)
 {
     root.UpdateScene(time, true);
@@ -77,7 +77,7 @@ void GroundTarget(CNode& root, float time)
     root.m_kMatrix.SetTranslation(translation);
 }
 
-// World matrices alone, from the local ones as they stand: the new tracks must not speak yet.
+// Computes world matrices from the current local ones, without evaluating the new tracks.
 void UpdateWorlds(CNode& root)
 {
     for (CNode* node : NodesOf(root))
@@ -94,8 +94,8 @@ uint64_t FrameCount(float last)
     return static_cast<uint64_t>(std::min(std::floor(last), kFrameLimit - 1.0f)) + 1;
 }
 
-// A new track at its full length, with the bone's rest pose in every frame: what the loop does not change
-// stands.
+// Creates a track at full length, with the bone's rest pose in every frame. Frames that the loop does not
+// write keep it.
 Ref<CKeyframeControl> MakeTrack(const CPoseMatcher::Bone& bone, size_t frameCount)
 {
     Ref<CKeyframeControl> track = new CKeyframeControl;
@@ -110,7 +110,7 @@ Ref<CKeyframeControl> MakeTrack(const CPoseMatcher::Bone& bone, size_t frameCoun
     return track;
 }
 
-// The root's way: the scaled motion of the source's hip, added up frame by frame. Sums are kept in 64 bits.
+// The root's path: the scaled motion of the source's hip, summed frame by frame in 64 bits.
 class CRootPath
 {
 public:
@@ -119,7 +119,7 @@ public:
     {
         SetBase(targetRoot.m_kWorldMatrix.Translation());
     }
-    /// The root's offset from the root position in the present frame.
+    /// Returns the root's offset from the root position in the current frame.
     Vec3 Advance(bool restart)
     {
         const Vec3 hip = HipPosition();
@@ -222,8 +222,7 @@ float CRetargeter::MeasuredScale()
     return 1.0f;
 }
 
-// One round over the frames; with legs that keep to the source a second one, since what they do in a frame
-// hangs on those before and after it.
+// One pass over the frames. Faithful legs need a second one, because each frame depends on its neighbors.
 void CRetargeter::PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks,
                              const Run& run, CFaithfulPose* keeper)
 {
@@ -258,7 +257,7 @@ void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframe
         legs.LeaveOut(keeper->Legs());
     }
     auto& bones = matcher.Bones();
-    bones.front().posed = true; // the root moves even where nothing turns it
+    bones.front().posed = true; // the root moves even if no source drives it
     for (size_t frame = 0; frame < frameCount; ++frame)
     {
         sampler.Sample(static_cast<float>(frame) / run.frequency);

@@ -6,7 +6,7 @@ namespace gw {
 
 namespace {
 
-// A leaky mean is late by what it smooths; run once in each direction it is not.
+// Exponential smoothing. One pass delays the curve; passes in both directions cancel the delay.
 template <class TIterator>
 void LeakyMean(TIterator value, TIterator end, double keep)
 {
@@ -24,7 +24,7 @@ void SmoothCurve(std::span<float> curve, double frames)
 {
     if (curve.empty() || !(frames > 0.0))
         return;
-    // Two rounds: the weights of one have a corner in the middle, which lets noise through.
+    // Two rounds: the kernel of a single one has a sharp peak, which lets noise through.
     const double keep = std::exp(-2.0 / frames);
     for (int round = 0; round < 2; ++round)
     {

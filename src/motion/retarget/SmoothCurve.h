@@ -4,8 +4,9 @@
 
 namespace gw {
 
-/// Smooths a curve of one value a frame without moving it in time: each value becomes a mean of all, the
-/// weight of which falls off on both sides within about `frames`. Takes time by the number of values alone.
+/// Smooths a curve of one value per frame without shifting it in time. Each value becomes a weighted mean of
+/// all, with weights that fall off within about `frames` on both sides. Time is linear in the number of
+/// values.
 void SmoothCurve(std::span<float> curve, double frames);
 
 } // namespace gw
