@@ -19,7 +19,7 @@ import sys
 from pathlib import Path
 
 ROOT = Path(__file__).resolve().parent.parent
-SECONDS = 300  # a fault that hangs is found
+SECONDS = 300  # a fault that causes a hang counts as found
 
 
 def faults(path, word):
@@ -33,7 +33,7 @@ def faults(path, word):
 
 
 def run(command, folder, seconds=None):
-    """Whether a command ends well and in time."""
+    """Returns whether a command succeeds in time."""
     try:
         return subprocess.run(command, cwd=folder, stdout=subprocess.DEVNULL, stderr=subprocess.DEVNULL,
                               timeout=seconds, check=False).returncode == 0
@@ -42,7 +42,7 @@ def run(command, folder, seconds=None):
 
 
 def prepare(copy):
-    """The copy at the present commit, with a build beside it."""
+    """Prepares the copy at the current commit, with its own build."""
     commit = subprocess.run(["git", "rev-parse", "HEAD"], cwd=ROOT, capture_output=True, text=True, check=True).stdout
     if (copy / ".git").exists():
         ready = run(["git", "checkout", "-q", "--force", "--detach", commit.strip()], copy)
@@ -73,7 +73,7 @@ def passes(copy, tests, jobs):
 
 
 def outcome(copy, tests, name, text, fault, jobs):
-    """What becomes of one fault: found, survives, or why it was not tried."""
+    """Returns the result of one fault: found, survives, or why it was not tried."""
     name, _, line = name.partition(":")
     path = copy / name
     source = path.read_text() if path.exists() else ""

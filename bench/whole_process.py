@@ -23,7 +23,7 @@ import tempfile
 
 from made_motion import USUAL_JOINTS, write_motion, write_profile
 
-INSTALLED = "MotionBuilder / HumanIK (2 spine joints, fingers)"  # the one that is chosen for the made motion
+INSTALLED = "MotionBuilder / HumanIK (2 spine joints, fingers)"  # chosen for the generated motion
 LINES = ["one", "four", "chosen", "faithful", "info", "choice"]
 LEAST_RUNS_BYTES = 10e6  # a smaller file takes so little time that it is run ten times as often
 

@@ -1,3 +1,6 @@
+// A view's clock and camera. The camera is placed so that the scene's bounding sphere fits; dragging then
+// moves it in steps proportional to the sphere's radius.
+
 #include "CGLView.h"
 
 #include <algorithm>

@@ -67,14 +67,14 @@ public:
     /// Chooses and sets the format of the surface, before it exists. Returns false, after reporting it, if
     /// there is no such format. A view without a surface does not need one.
     virtual bool SetupPixelFormat() { return true; }
-    /// Sets up a new, current GL context for drawing.
+    /// Sets up a new GL context, which must be current.
     virtual void InitGL() {}
     /// Returns the lines of the scene in its current state; valid until the next call.
     virtual const CDrawList& DrawScene();
 
     uint32_t m_uiTimer = 0;   ///< a window's timer; Stop sets it to 0
     CCamera m_kCamera;        ///< m_kEye, m_kUp and m_kLookAt drive the view
-    Vec3 m_kPan = kVec3Zero;  ///< extra translation of the camera's space
+    Vec3 m_kPan = kVec3Zero;  ///< additional translation in camera space
     std::string m_kHighlight; ///< name of the bone that is drawn in another color
 
 private:

@@ -13,7 +13,7 @@ class CMotionView
 public:
     virtual ~CMotionView() = default;
 
-    /// Stops, goes to time 0 and shows another scene, which the view keeps alive; null shows nothing.
+    /// Stops, rewinds to time 0 and shows another scene, which the view keeps alive. Null shows nothing.
     virtual void SetScene(CNode* root, float frameStep, float lastFrame) = 0;
     virtual void SeekStart() = 0;
     virtual void SeekEnd() = 0;
@@ -28,8 +28,11 @@ public:
     virtual void Advance() = 0;
 
     virtual bool IsPlaying() const = 0;
+    /// Returns the current scene time.
     virtual float GetTime() const = 0;
+    /// Returns the scene time between two frames.
     virtual float GetFrameStep() const = 0;
+    /// Returns the index of the last frame.
     virtual float GetLastFrame() const = 0;
     /// Sets the bone to draw in another color by its exact name; empty for none.
     virtual void SetHighlight(const std::string& boneName) = 0;

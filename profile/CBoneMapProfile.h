@@ -34,7 +34,7 @@ public:
     /// Returns whether any row drives the target's root bone.
     virtual bool HasRootMapping() const { return true; }
     virtual void GetRootOffset(Vec3& offset) const { offset = m_kRootOffset; }
-    /// Frames per second.
+    /// Returns the frame rate in frames per second.
     virtual int GetFrameRate() const { return m_iFrameRate; }
     virtual void PromptSaveChanges() {}
 

@@ -1,3 +1,5 @@
+// The rows of a bone map as texts, as the list shows them. Numbers are parsed when they are used.
+
 #include "CMapRowTable.h"
 
 #include "HostBones.h"

@@ -61,6 +61,7 @@ public:
     int RowCount() const { return static_cast<int>(m_kRows.size()); }
     /// Returns the text in a row and column; empty for an invalid row.
     const std::string& Text(int row, int column) const;
+    /// Returns true if the target bone of a row has no source.
     bool IsFixed(int row) const;
     /// Returns a row's rotation and axes as numbers. An empty axis is the neutral one.
     RowNumbers Numbers(int row) const;
@@ -84,6 +85,7 @@ public:
     void SelectOnly(int row);
     bool IsSelected(int row) const { return Has(row) && m_kSelected[Index(row)]; }
     int SelectedCount() const;
+    /// Returns true if any selected row is a fixed one.
     bool IsFixedSelected() const;
     /// Returns the first selected row after an index, or kNone. Start with kNone.
     int NextSelected(int after) const;

@@ -1,3 +1,9 @@
+// The history stores whole states and not changes. A bone map has about twenty rows, so a state is small, and
+// restoring one cannot fail or depend on the order of removals. Two stacks hold the states to undo and to
+// redo; a step moves the present state to one stack and replaces it with the top of the other. A step that
+// would change nothing visible is skipped, so each undo shows an effect. Each pass of that loop removes a
+// state, so it ends.
+
 #include "CProfileHistory.h"
 
 #include <utility>

@@ -12,7 +12,7 @@ namespace gw {
 /// Everything in a profile that a user can change, at one moment.
 struct CProfileState
 {
-    CMapRowTable rows; ///< with their selection
+    CMapRowTable rows; ///< including their selection
     std::string name;
     std::string path;
     Vec3 rootOffset = kVec3Zero;

@@ -17,7 +17,7 @@ class CProfileTexts
 public:
     struct Entry
     {
-        std::string file;                     ///< in the folder
+        std::string file;                     ///< file name
         std::string name;                     ///< display name; empty if the file cannot be read
         std::optional<std::string_view> text; ///< no value if the file cannot be read or is too long
     };
@@ -32,8 +32,8 @@ public:
 private:
     void Add(const std::string& folder, const std::string& file, std::optional<std::string_view> packed);
 
-    std::string m_kPack;            // its bytes
-    std::deque<std::string> m_kOwn; // texts that are not from the pack
+    std::string m_kPack;            // bytes of the pack
+    std::deque<std::string> m_kOwn; // texts that were read from their own files
     std::vector<Entry> m_kEntries;
 };
 

@@ -14,7 +14,7 @@ class CNode;
 class CBoneNames
 {
 public:
-    /// A null root has no bones.
+    /// Lists the bones below a root; a null root has no bones.
     explicit CBoneNames(CNode* root);
 
     /// Returns the first node, in search order, with exactly this name, otherwise the first one that matches

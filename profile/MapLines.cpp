@@ -1,3 +1,5 @@
+// Parses and writes the older map syntax. Any text is a valid line, so parsing cannot fail.
+
 #include "MapLines.h"
 
 #include "CSafeFile.h"
@@ -23,7 +25,7 @@ Vec3 ParseThree(std::string_view text)
 void ParseMapping(std::string_view text, MapLine& line)
 {
     line.source = NextWord(text);
-    NextWord(text); // the arrow
+    NextWord(text); // skip the arrow
     line.target = NextWord(text);
     const size_t begin = text.find_first_not_of(kTokenDelimiters);
     // A dot means that no rotation was set.

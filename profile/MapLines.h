@@ -17,7 +17,7 @@ enum class EMapLine : uint8_t
     Position,  ///< the root position
     FrameRate, ///< frames per second
     Mapping,   ///< a source bone that drives a target bone
-    Fixed,     ///< a target bone without a source: a line with a star and no arrow
+    Fixed,     ///< a target bone without a source: a line with a star and without an arrow
 };
 
 /// One line of the older map syntax: its text and its meaning. Only the members of its kind are used.
@@ -38,8 +38,9 @@ MapLine ParseMapLine(std::string_view text);
 // Lines as written by the map tool. Numbers are truncated toward zero.
 std::string PositionLine(const Vec3& position);
 std::string FrameRateLine(int frameRate);
-/// A mapping without a rotation.
+/// Returns the line of a mapping without a rotation.
 std::string MappingLine(std::string_view source, std::string_view target);
+/// Returns the line of a mapping with rotations about X, Y and Z in degrees.
 std::string MappingLine(std::string_view source, std::string_view target, const Vec3& degrees);
 
 /// Reads all lines of a map or profile file. Returns false, leaving `lines` unchanged, if it cannot be read.

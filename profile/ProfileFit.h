@@ -22,7 +22,7 @@ struct MissingBone
     ESkeletonSide side = ESkeletonSide::Source;
     std::string name;
     std::string nearest; ///< the most similar name in that skeleton, or empty; for the first 100 only
-    int row = 0;         ///< in the row table
+    int row = 0;         ///< index in the row table
     size_t line = 0;     ///< in the file, starting at 1; 0 for rows without a file
 };
 

@@ -25,9 +25,9 @@ private:
     struct Row
     {
         CNode* target;
-        CNode* source; ///< of the motion that is not aligned; null for none
+        CNode* source; ///< of the original motion; null if there is none
         bool fixed;
-        Mat3 turn = kMat3Identity; ///< at rest, against the source's
+        Mat3 turn = kMat3Identity; ///< rotation at rest, relative to the source's
     };
 
     Row* RowOf(const char* target);
@@ -77,7 +77,7 @@ bool CBoneAimer::LiesInTrunk(const CNode* source) const
     return found != m_kIndex.end() && alignment_.joints[found->second].axis == kVec3UnitY;
 }
 
-// A collar tells nothing of the torso's turn that its own does not spoil.
+// A collar's rotation says nothing about the torso that the torso's own would not say better.
 void CBoneAimer::TakeSpine()
 {
     const std::vector<CNode*>& spine = source_.body.spine;
@@ -90,7 +90,7 @@ void CBoneAimer::TakeSpine()
     waist->source = spine.size() > 1 ? spine[(spine.size() - 1) / 2] : nullptr;
 }
 
-// Left to itself a collar would share the upper arm's turn, from a frame that lies across its own.
+// Without this, a collar would share the upper arm's rotation, from a frame across its own.
 void CBoneAimer::TakeCollars()
 {
     const Row* const torso = RowOf(kTorsoBone);
@@ -102,7 +102,7 @@ void CBoneAimer::TakeCollars()
     }
 }
 
-// Legs hang on the pelvis, which need not lie as the bone from hip to spine does.
+// Legs are attached to the pelvis, whose direction can differ from that of the bone from hip to spine.
 void CBoneAimer::TakePelvis()
 {
     for (const HostSide& side : kHostSides)
@@ -137,7 +137,7 @@ void CBoneAimer::Aim()
     TakeCollars();
     TakePelvis();
     table_.SetScenes(aligned_.root.Get(), &targetRoot_);
-    table_.SetPlainTurns(true); // a T-pose is made of whole quarter turns
+    table_.SetPlainTurns(true); // a T-pose consists of exact quarter turns
     for (const Row& row : m_kRows)
         SetRow(row);
 }

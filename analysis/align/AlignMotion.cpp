@@ -1,7 +1,7 @@
-// The new local pose of a joint follows from the old one without a look at the world: with A its own turn
-// and P its parent's, the rotation L becomes inverse(A) · L · P and the translation t becomes t · P. So a
-// bone's length stays exact however deep it hangs. Rotations alone make a BVH; where a file scales bones,
-// the scale goes into the translations of what is below.
+// A joint's new local pose can be computed from the old one without its world matrix: with A the joint's own
+// rotation and P its parent's, the rotation L becomes inverse(A) · L · P and the translation t becomes t · P.
+// So a bone's length stays exact, however deep it is in the tree. A BVH contains rotations only; if a file
+// scales bones, the scale is applied to the translations below.
 
 #include "AlignMotion.h"
 
@@ -21,8 +21,8 @@ namespace gw {
 
 namespace {
 
-// Part of a bone's length by which a position may differ from the rest pose's and be the same; and by which
-// one that repeats an offset does so in other digits.
+// The part of a bone's length by which a position can differ from the rest pose's and still count as equal,
+// or by which it can repeat an offset with other digits.
 constexpr double kSamePosition = 1e-6;
 constexpr double kSameRepeated = 0.01;
 
@@ -60,8 +60,8 @@ private:
     const Alignment& alignment_;
     EAlignedJoints m_eJoints;
     AlignedMotion m_kResult;
-    std::vector<CKeyframeControl*> m_kTracks; // null where a joint does not move
-    std::vector<Vec3> m_kScales;              // of each joint in the world, at the frame
+    std::vector<CKeyframeControl*> m_kTracks; // null if a joint does not move
+    std::vector<Vec3> m_kScales;              // world scale of each joint at the frame
 };
 
 void CMotionAligner::AddJoint(const JointAlignment& joint)
@@ -116,7 +116,7 @@ void CMotionAligner::AddKey(size_t index, int frame)
     const double same = (joint.tellOnce ? kSameRepeated : kSamePosition) * Vec3Length(still);
     const bool isStill = keys.size() <= 1 && Vec3Length(position - still) <= same;
     if (isStill && !keys.empty())
-        return; // the last key stands in for those that are missing
+        return; // the last key repeats for missing ones
     if (keys.size() == 1 && frame > 1)
         keys.assign(static_cast<size_t>(frame), Vec3(keys.front()));
     keys.push_back(isStill ? still : position);

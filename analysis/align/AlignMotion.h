@@ -8,23 +8,23 @@
 
 namespace gw {
 
-/// A motion told from another rest pose.
+/// A motion expressed relative to another rest pose.
 struct AlignedMotion
 {
     Ref<CNode> root;
-    std::vector<CNode*> joints; ///< as those of the alignment, in its order
+    std::vector<CNode*> joints; ///< in the order of the alignment's joints
 };
 
 /// Which joints of an aligned motion move.
 enum class EAlignedJoints : uint8_t
 {
     All,
-    Body, ///< those of the body and what bears them; fingers and faces keep to their rest pose
+    Body, ///< the body's joints and their ancestors; fingers and faces keep their rest pose
 };
 
-/// Tells a motion from the rest pose of its alignment, as a tree of its own: a track and a bone mesh for each
-/// joint, whose world positions are those of the source at every frame, turned so that Y is up. Bones of the
-/// body have the frames that the target's have at rest. Positions stand in a track only where they change.
+/// Expresses a motion relative to the rest pose of its alignment, as a new tree: a track and a bone mesh for
+/// each joint, whose world positions equal the source's at every frame, rotated so that Y is up. The body's
+/// bones have the frames of the target's bones at rest. A track contains positions only if they change.
 AlignedMotion AlignMotion(const BodyMotion& motion, const Alignment& alignment,
                           EAlignedJoints joints = EAlignedJoints::All);
 

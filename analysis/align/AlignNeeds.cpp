@@ -16,7 +16,8 @@ namespace gw {
 
 namespace {
 
-constexpr double kOffAxis = 30.0; // degrees that a limb may lie beside its axis, or its frame about it
+// in degrees: the maximum angle of a limb from its axis, or of its frame's twist
+constexpr double kOffAxis = 30.0;
 
 bool IsLimb(EBodyPart part)
 {
@@ -32,7 +33,7 @@ bool IsLimb(EBodyPart part)
     }
 }
 
-// By how much the frame of a bone is turned about it against one that is only swung from an axis.
+// Returns the twist of a bone's frame, compared with one that is only swung from an axis.
 double FrameTwist(const CNode& joint)
 {
     CBoneMesh* const mesh = FindBoneMesh(joint);

@@ -9,7 +9,8 @@ namespace gw {
 
 class CTreePoser;
 
-/// What of the zero pose is not as a T-pose: the tree is posed so. A joint is named once for each need.
+/// Returns the differences of the zero pose from a T-pose; the tree is posed for it. A joint is listed once
+/// per need.
 std::vector<AlignFinding> FindRestNeeds(const CTreePoser& tree, const std::vector<JointRole>& roles,
                                         double legLength);
 

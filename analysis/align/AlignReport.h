@@ -6,16 +6,16 @@
 
 namespace gw {
 
-/// What stands against the rules in a motion, and an alignment mends.
+/// A problem of a motion that an alignment corrects.
 enum class EAlignNeed : uint8_t
 {
-    RestPose,         ///< a bone does not lie where a T-pose has it; `degrees` from there
+    RestPose,         ///< a bone is not where a T-pose has it; off by `degrees`
     UpAxis,           ///< the motion's up axis is not Y; `joint` is its name: "Z", "-Y"
-    BoneFrames,       ///< a slanted offset turns the bone's frame about the bone; `degrees` by which
-    DoubledPositions, ///< positions repeat the joint's offset, so that its bone comes out doubled
+    BoneFrames,       ///< a slanted offset twists the bone's frame by `degrees`
+    DoubledPositions, ///< positions repeat the joint's offset, which doubles the bone
 };
 
-/// One thing that an alignment mends.
+/// One problem that an alignment corrects.
 struct AlignFinding
 {
     EAlignNeed need;
@@ -23,11 +23,11 @@ struct AlignFinding
     double degrees = 0.0;
 };
 
-/// What an alignment found in a motion.
+/// The findings of an alignment.
 struct AlignReport
 {
     std::vector<AlignFinding> findings;
-    /// The frame whose pose tells how the bones are turned, or -1 where the zero pose does.
+    /// The frame whose pose defines the bones' rotations, or -1 for the zero pose.
     int referenceFrame = -1;
 };
 

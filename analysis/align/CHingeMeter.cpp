@@ -6,11 +6,11 @@ namespace gw {
 
 namespace {
 
-// Sine of the least bend that tells, 20 degrees: joints beside the bones' real ends bend a straight limb by
+// Sine of the minimum bend, 20 degrees: joints placed beside the bones' real ends bend a straight limb by
 // half as much.
 constexpr double kLeastSine = 0.34;
 constexpr int kLeastFrames = 5;
-// Length of the mean of the axes, as a share of that of axes that all agree: they lie within 35 degrees.
+// Minimum length of the mean of the axes, relative to that of identical axes: they lie within 35 degrees.
 constexpr double kAgreement = 0.8;
 
 } // namespace

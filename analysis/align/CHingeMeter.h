@@ -6,15 +6,15 @@
 
 namespace gw {
 
-/// Where the axis of a hinge, a knee or an elbow, lies in the space of one of its two bones while frames go
-/// by: the mean of the axes about which the bones are bent.
+/// Measures the axis of a hinge, a knee or an elbow, in the space of one of its two bones over many frames:
+/// the mean of the axes about which the bones are bent.
 class CHingeMeter
 {
 public:
-    /// Takes the present pose, of which `upper` and `lower` are the bones' ways, as the next frame; one in
-    /// which the hinge is nearly straight, or folded, tells nothing.
+    /// Adds the current pose, in which `upper` and `lower` are the bones' directions. Ignored if the hinge is
+    /// nearly straight or folded.
     void Add(const Vec3& upper, const Vec3& lower, const CNode& bone);
-    /// The axis, a unit vector; none where the hinge hardly bends or bends about many axes.
+    /// Returns the axis, a unit vector; nothing if the hinge hardly bends or has no consistent axis.
     std::optional<Vec3> Axis() const;
 
 private:

@@ -1,3 +1,6 @@
+// One pass over the motion collects everything that single poses cannot show: hinge axes, sole normals, mean
+// directions of bones without length, and the frame that is closest to a standing pose.
+
 #include "CMotionEvidence.h"
 
 #include "Alignment.h"
@@ -12,7 +15,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kSampleSeconds = 1.0 / 30.0; // contacts are told by no finer steps
+constexpr double kSampleSeconds = 1.0 / 30.0; // contacts need no finer steps
 
 int FrameStep(const BodyMotion& motion)
 {
@@ -22,7 +25,7 @@ int FrameStep(const BodyMotion& motion)
     return static_cast<int>(std::clamp(step, 1.0, std::max(1.0, motion.frameCount / 30.0)));
 }
 
-// What the parts of a body weigh when a reference pose is looked for.
+// Weights of body parts in the search for a reference pose.
 constexpr double kFootWeight = 0.5;
 constexpr double kElbowWeight = 0.3;
 constexpr double kArmWeight = 0.2;
@@ -52,8 +55,8 @@ void AddArm(const BodyArm& arm, const Vec3& up, const Vec3& sideways, CWeighedEr
         error.Add(AngleBetween(upper, WayTo(arm.forearm, arm.hand)), kElbowWeight);
 }
 
-// Degrees by which a body strays from standing upright and straight, its limbs weighed by what they tell
-// about a reference pose: legs down, shoulders over the hips, arms straight and down or sideways.
+// Returns, in degrees, how far a body is from standing upright and straight, weighing the limbs by their
+// significance for a reference pose: legs down, shoulders above the hips, arms straight and down or sideways.
 double StanceError(const CBodyMap& body, const Vec3& up)
 {
     CWeighedError error;

@@ -13,31 +13,32 @@ namespace gw {
 
 struct BodyMotion;
 
-/// A joint of the trunk whose bone has no length of its own, and the next one above that stands apart.
+/// A trunk joint whose bone has no length, and the next joint above that is apart from it.
 struct LooseWay
 {
     CNode* from;
     CNode* to;
 };
 
-/// What a whole motion tells of the body's bones: about which axes knees and elbows bend, how the soles lie,
-/// and in which frame the body stands most like a figure in a reference pose.
+/// What a whole motion shows about the body's bones: the axes of knees and elbows, the orientation of the
+/// soles, and the frame that is closest to a reference pose.
 class CMotionEvidence
 {
 public:
-    /// Looks at the motion, at thirty frames a second or all there are. `worldTurn` turns it so that Y is up.
+    /// Examines the motion at thirty frames per second, or all frames if there are fewer. `worldTurn` rotates
+    /// it so that Y is up.
     CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn, std::span<const LooseWay> ways);
 
-    /// The axis of a knee or an elbow in the space of one of its bones: cross(upper way, lower way).
+    /// Returns the axis of a knee or an elbow in the space of one of its bones: cross(upper way, lower way).
     std::optional<Vec3> HingeAxis(const CNode& bone) const;
-    /// The sole's normal in the foot's space.
+    /// Returns the sole's normal in the foot's space.
     const std::optional<Vec3>& SoleNormal(EBodySide side) const
     {
         return m_kSoles[static_cast<size_t>(side)];
     }
-    /// Where a loose way leads on the whole, in the space of its joint; none for other joints.
+    /// Returns the mean direction of a loose way in the space of its joint; nothing for other joints.
     std::optional<Vec3> MeanWay(const CNode& from) const;
-    /// The frame that is most like a reference pose; -1 in a motion without frames.
+    /// Returns the frame closest to a reference pose; -1 in a motion without frames.
     int ReferenceFrame() const { return m_iReferenceFrame; }
 
 private:

@@ -11,7 +11,7 @@ namespace gw {
 namespace {
 
 constexpr double kLeastStandSeconds = 0.2;
-// A foot that rolls from heel to toe stands on its sole in most of its frames; the others are left out.
+// A foot that rolls from heel to toe is flat in most of its standing frames; the others are left out.
 constexpr double kStray = 20.0; // degrees
 constexpr double kLeastAgreeing = 0.6;
 
@@ -23,7 +23,7 @@ Vec3 MeanOf(const std::vector<Vec3>& directions)
     return Vec3Normalized(sum);
 }
 
-// The mean without what strays from it; none where much does.
+// Returns the mean without outliers; nothing if too many directions disagree.
 std::optional<Vec3> AgreedMean(std::vector<Vec3> directions)
 {
     const size_t count = directions.size();

@@ -9,17 +9,17 @@
 
 namespace gw {
 
-/// How the soles lie in the spaces of their feet: while a foot stands, its sole is level.
+/// Measures the soles' orientation in the spaces of their feet: while a foot stands, its sole is level.
 class CSoleMeter
 {
 public:
-    /// `worldTurn` turns the motion so that Y is up.
+    /// `worldTurn` rotates the motion so that Y is up.
     CSoleMeter(const CBodyMap& body, const Mat3& worldTurn);
 
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Add();
-    /// The sole's normal in the foot's space; none where the foot does not stand long enough, or stands this
-    /// way and that.
+    /// Returns the sole's normal in the foot's space; nothing if the foot does not stand long enough or
+    /// consistently.
     std::optional<Vec3> Normal(EBodySide side, double leg, double secondsPerFrame) const;
 
 private:
@@ -29,7 +29,7 @@ private:
         const CNode* toe;
         std::vector<Vec3> ankles;
         std::vector<Vec3> toes;
-        std::vector<Vec3> ups; // the world's up in the foot's space
+        std::vector<Vec3> ups; // world up in the foot's space
     };
 
     float FloorOf(std::vector<Vec3> Foot::*joint) const;

@@ -7,7 +7,7 @@ namespace gw {
 
 namespace {
 
-// The child joint that lies farthest off at rest: the hand of a forearm, beside its twist joints.
+// Returns the child joint that is farthest away at rest: a forearm's hand instead of its twist joints.
 CNode* FarthestChild(const CNode* joint)
 {
     CNode* farthest = nullptr;
@@ -23,7 +23,7 @@ CNode* FarthestChild(const CNode* joint)
     return farthest;
 }
 
-// The joints from below the hip up to where the arms part.
+// Fills in the joints from below the hip up to where the arms branch.
 void CompleteSpine(CBodyMap& body)
 {
     if (!body.spine.empty() || !body.neck.empty() || body.head)

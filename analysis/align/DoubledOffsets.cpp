@@ -1,5 +1,5 @@
-// Joint positions in a BVH are added to the offset. Many writers put the whole place into them, so that it
-// stands twice in the keys.
+// Joint positions in a BVH are added to the offset. Many writers put the complete position there, so that the
+// offset is contained twice in the keys.
 
 #include "DoubledOffsets.h"
 
@@ -13,11 +13,11 @@ namespace gw {
 namespace {
 
 constexpr int kDoubledSamples = 32;
-constexpr double kRepeats = 0.01; // of an offset: positions that are as near to it say it again
-// Where a file's positions are whole ones, those of joints that move stand around the offset.
+constexpr double kRepeats = 0.01; // of an offset: positions this close to it repeat it
+// If a file's positions are complete ones, those of joints that move are around the offset.
 constexpr double kAround = 0.5;
 
-// What the keys of a joint say of its offset, frame by frame.
+// Compares a joint's keys with its offset, frame by frame.
 class CDoubledMeter
 {
 public:
@@ -61,7 +61,7 @@ std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
     }
     const auto repeating = std::ranges::count_if(meters, &CDoubledMeter::Repeats);
     const auto around = std::ranges::count_if(meters, &CDoubledMeter::StandsAround);
-    // In a file whose positions are whole ones nearly all joints repeat; some of the rest move.
+    // In a file with complete positions, nearly all joints repeat their offset; some of the others move.
     const bool areWhole = repeating * 2 >= around && repeating > 0;
     std::vector<bool> doubled;
     for (const CDoubledMeter& meter : meters)

@@ -7,8 +7,8 @@ namespace gw {
 class CTreePoser;
 struct BodyMotion;
 
-/// For each joint of a motion whether its positions repeat its offset, which then stands twice in them. Poses
-/// the tree.
+/// Returns, for each joint of a motion, whether its positions repeat its offset, which is then contained
+/// twice. Poses the tree.
 std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion);
 
 } // namespace gw

@@ -14,14 +14,14 @@ namespace gw {
 
 namespace {
 
-constexpr double kLeastReach = 0.05; // of a leg: a shorter way ahead says nothing of the heading
-constexpr double kOddNormal = 50.0;  // degrees: a foot that stands does not lie so far off its stance
-// How ankle to toe slope down in a foot that stands, in degrees: usually, and at the least and most.
+constexpr double kLeastReach = 0.05; // of a leg: a shorter vector does not show the heading
+constexpr double kOddNormal = 50.0;  // in degrees: a standing foot is not this far off its stance
+// Slope from ankle to toe in a standing foot, in degrees: usual, minimum and maximum.
 constexpr double kSlope = 25.0;
 constexpr double kLeastSlope = 5.0;
 constexpr double kMostSlope = 50.0;
 
-// Where a foot may lead to, from its toe on outward.
+// Returns the possible directions of a foot, from its toe outward.
 std::vector<Vec3> WaysAhead(const BodyLeg& leg)
 {
     std::vector<Vec3> ways;
@@ -37,7 +37,7 @@ std::vector<Vec3> WaysAhead(const BodyLeg& leg)
     return ways;
 }
 
-// The first way that goes ahead, or the body's facing.
+// Returns the first direction that points ahead, or the body's facing.
 Vec3 WayAhead(const BodyLeg& leg, const CReferencePose& pose, const Vec3& up)
 {
     for (const Vec3& way : WaysAhead(leg))
@@ -48,7 +48,7 @@ Vec3 WayAhead(const BodyLeg& leg, const CReferencePose& pose, const Vec3& up)
     return pose.facing;
 }
 
-// The normal of a sole of which no more is known than the way to the toe.
+// Returns the normal of a sole if only the direction to the toe is known.
 Vec3 NormalBySlope(const Vec3& way, const CReferencePose& pose)
 {
     const Vec3 ahead = Vec3Normalized(way);

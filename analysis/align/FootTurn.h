@@ -9,9 +9,9 @@ namespace gw {
 
 struct CReferencePose;
 
-/// What turns the space of a foot to that of a foot that stands: heading along +Z, sole's normal along +Y.
-/// `standing` is the normal in the foot's space as the motion tells it; without one the present pose does,
-/// whose soles are taken to be level where `isLevel` says so or the foot slopes as one does that stands.
+/// Returns the rotation from a foot's space to that of a standing foot: heading along +Z, sole normal along
+/// +Y. `standing` is the normal in the foot's space measured from the motion. Without it, the current pose is
+/// used, whose soles are assumed to be level if `isLevel` is set or the foot slopes like a standing one.
 Mat3 FootTurn(const BodyLeg& leg, const CReferencePose& pose, const std::optional<Vec3>& standing,
               bool isLevel);
 

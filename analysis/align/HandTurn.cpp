@@ -11,11 +11,12 @@ namespace gw {
 
 namespace {
 
-constexpr double kMostBend = 60.0;    // degrees: what lies farther from the forearm is no direction of a hand
-constexpr size_t kFingersOfAPalm = 3; // and a thumb
+// in degrees: a vector farther from the forearm's direction does not show the hand's
+constexpr double kMostBend = 60.0;
+constexpr size_t kFingersOfAPalm = 3; // plus a thumb
 constexpr double kLeastPalm = 0.02;   // of a leg, from knuckle to knuckle
 
-// The ways from the wrist to the fingers' first joints that lie apart from it.
+// Returns the vectors from the wrist to the fingers' first joints, if they are apart from it.
 std::vector<Vec3> FingerWays(const CNode& hand, double apart)
 {
     std::vector<Vec3> ways;
@@ -40,7 +41,8 @@ Vec3 MeanDirection(const std::vector<Vec3>& ways)
     return Vec3Normalized(sum);
 }
 
-// Takes the thumb out: of two fingers the one that strays more from the arm, of many that from all others.
+// Removes the thumb: of two fingers the one farther from the arm's direction, of several the one farthest
+// from the others.
 Vec3 TakeThumb(std::vector<Vec3>& ways, const Vec3& arm)
 {
     const Vec3 middle = ways.size() == 2 ? arm : MeanDirection(ways);
@@ -51,7 +53,8 @@ Vec3 TakeThumb(std::vector<Vec3>& ways, const Vec3& arm)
     return way;
 }
 
-// From the little finger's knuckle to that beside the thumb; zero where the fingers do not spread.
+// Returns the vector from the little finger's knuckle to the one beside the thumb; zero if the fingers do not
+// spread.
 Vec3 PalmLine(const std::vector<Vec3>& ways, const Vec3& thumb, double least)
 {
     Vec3 line = kVec3Zero;

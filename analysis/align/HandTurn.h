@@ -7,8 +7,8 @@ namespace gw {
 
 struct CReferencePose;
 
-/// What turns a posed hand to one that lies along its arm in a T-pose, palm down. `start` turns the forearm
-/// so; without fingers or an end the hand goes along with it.
+/// Returns the rotation from a posed hand to one in line with its arm in a T-pose, palm down. `start` does
+/// the same for the forearm; a hand without fingers or an end follows it.
 Mat3 HandTurn(const CNode& hand, EBodySide side, const CReferencePose& pose, const Mat3& start);
 
 } // namespace gw

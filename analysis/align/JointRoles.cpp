@@ -1,3 +1,7 @@
+// Gives every joint of a skeleton its body part. The body map only names the main joints, so each limb is
+// filled as a chain: a joint between two named ones belongs to the upper one. Everything else keeps no part
+// and follows its parent.
+
 #include "JointRoles.h"
 
 #include "BodyTree.h"
@@ -41,7 +45,7 @@ private:
     std::vector<JointRole> m_kRoles;
 };
 
-// Joints that are missing are passed over.
+// Missing joints are skipped.
 void CRoleFinder::AddChain(std::span<const Stop> chain, EBodySide side)
 {
     std::vector<Stop> stops;
@@ -110,7 +114,7 @@ void CRoleFinder::AddLimbs(EBodySide side)
     FillShoulder(side);
 }
 
-// What stands between the trunk and an upper arm is a clavicle where the body names none.
+// A joint between the trunk and an upper arm is a clavicle if the body does not name one.
 void CRoleFinder::FillShoulder(EBodySide side)
 {
     const BodyArm& arm = body_.Arm(side);

@@ -10,11 +10,11 @@ namespace gw {
 
 class CTreePoser;
 
-/// What a joint is to the body. A joint between two of these has the part of the upper one: the twist joint
-/// of a thigh is a thigh.
+/// The body part of a joint. A joint between two of these belongs to the upper one: the twist joint of a
+/// thigh is a thigh.
 enum class EBodyPart : uint8_t
 {
-    None, ///< a finger, an eye, a helper: goes along with its parent
+    None, ///< a finger, an eye, a helper: follows its parent
     AboveHip,
     Hip,
     Spine,
@@ -34,18 +34,18 @@ struct JointRole
 {
     EBodyPart part = EBodyPart::None;
     EBodySide side = EBodySide::Left; ///< of a limb
-    CNode* next = nullptr;            ///< the child on the way down the limb or up the spine, or null
-    bool carriesArms = false;         ///< of the trunk: where the arms part from the spine
+    CNode* next = nullptr;            ///< the child along the limb or up the spine, or null
+    bool carriesArms = false;         ///< of the trunk: the arms branch off here
 };
 
-/// The roles of all joints of a tree, in its order. Joints of the body that do not hang as they should (a
-/// forearm that is not below its upper arm) have their own part alone.
+/// Returns the roles of all joints, in tree order. Joints that are not where they should be in the tree (a
+/// forearm that is not below its upper arm) only get their own role.
 std::vector<JointRole> FindRoles(const CTreePoser& tree, const CBodyMap& body);
 
-/// Whether a part is of the spine, hip and neck included.
+/// Returns whether a part belongs to the spine, including hip and neck.
 bool IsTrunk(EBodyPart part);
 
-/// The axis along which a part lies in the rest pose that suits the rules; zero where it has none.
+/// Returns the axis of a part in a T-pose; zero if it has none.
 Vec3 AxisOf(const JointRole& role);
 
 } // namespace gw

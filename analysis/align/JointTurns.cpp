@@ -1,8 +1,8 @@
 // A joint's new axes come from one pose in which every bone's direction in the canonical stance is known. A
-// bone is swung there by the least angle, from the alignment of what bears it, so that what a pose says of
-// the twist about the bone is kept: an arm that hangs, palm at the thigh, becomes one that stretches
-// sideways, palm down. Where knees and elbows bend enough to show their axes, these say more of the twist
-// than any rest pose, and overrule one that is far off.
+// bone is swung there by the smallest angle, starting from its parent's alignment, so that the pose's twist
+// about the bone is kept: an arm that hangs with its palm at the thigh becomes one that stretches sideways,
+// palm down. If knees and elbows bend enough to show their axes, these show the twist better than any rest
+// pose, and overrule one that is far off.
 
 #include "JointTurns.h"
 
@@ -20,13 +20,14 @@ namespace gw {
 
 namespace {
 
-constexpr double kApartOfHip = 0.04; // what a hip's shorter way to the spine says is not about the pelvis
-// Degrees by which a hip's way to the spine may lean and be that along which the pelvis lies; one to a joint
-// at the small of the back leads backward, and the way to a joint farther up has to lean less.
+// below this, a hip's vector to the spine does not show the pelvis's direction
+constexpr double kApartOfHip = 0.04;
+// The maximum lean, in degrees, of a hip's vector to the spine that shows the direction of the pelvis. A
+// vector to a joint at the small of the back points backward, and the one to a joint farther up leans less.
 constexpr double kHipLean = 40.0;
 constexpr double kChordLean = 20.0;
-// Degrees by which a hinge's axis may differ from the pose's before it is believed: less is how people stand
-// and how joints are placed.
+// The difference in degrees from which a hinge's axis overrules the pose: less is due to posture and the
+// placement of joints.
 constexpr double kTwistLimit = 30.0;
 
 class CTurnFinder
@@ -61,7 +62,7 @@ private:
     std::vector<Mat3> m_kTurns;
 };
 
-// The way to the next joint of the body that lies apart; zero where there is none.
+// Returns the vector to the next joint of the body that is apart; zero if there is none.
 Vec3 CTurnFinder::WayOn(const CNode& from, const CNode* next, double apart) const
 {
     if (const std::optional<Vec3> loose = evidence_.MeanWay(from))
@@ -71,7 +72,7 @@ Vec3 CTurnFinder::WayOn(const CNode& from, const CNode* next, double apart) cons
     return WayTo(next ? &from : nullptr, next);
 }
 
-// Up the spine, as far as it takes to lean less.
+// Goes up the spine until the vector leans less.
 Vec3 CTurnFinder::HipWay(size_t joint) const
 {
     const CNode& hip = *tree_.Joints()[joint];
@@ -98,8 +99,8 @@ Mat3 CTurnFinder::TrunkSwing(size_t joint) const
     return start * LeastSwing(Turned(way, start), kVec3UnitY);
 }
 
-// What a limb's bone is swung from: the bone above where that is of the same limb, else the trunk. Upper
-// arms do not take the clavicle's swing over, which goes up where theirs goes down.
+// Returns what a limb's bone is swung from: the bone above if it belongs to the same limb, otherwise the
+// trunk. Upper arms do not follow the clavicle's swing, which goes up where theirs goes down.
 Mat3 CTurnFinder::StartOf(size_t joint) const
 {
     const EBodyPart part = roles_[joint].part;
@@ -112,8 +113,8 @@ Mat3 CTurnFinder::StartOf(size_t joint) const
     return part == EBodyPart::Thigh ? pose_.hips : pose_.trunk;
 }
 
-// The turn about the bone that brings a hinge's axis where it belongs: left and right knees bend about +X,
-// a left elbow about -Y and a right one about +Y.
+// Returns the twist about the bone that brings a hinge's axis into place: knees bend about +X, a left elbow
+// about -Y and a right one about +Y.
 Mat3 CTurnFinder::HingeTwist(size_t joint, const Mat3& swing) const
 {
     const JointRole& role = roles_[joint];
@@ -168,7 +169,7 @@ void CTurnFinder::Set(size_t joint)
     Mat3& turn = m_kTurns[joint];
     if (tree_.Joints()[joint] == body_.Leg(role.side).foot)
         turn = FootTurn(body_.Leg(role.side), pose_, evidence_.SoleNormal(role.side), m_bIsRest);
-    else if (isForefoot && parent >= 0) // lies on the floor as the ankle's bone does
+    else if (isForefoot && parent >= 0) // is on the floor like the ankle's bone
         turn = WorldTurn(joint) * Mat3Transpose(WorldTurn(static_cast<size_t>(parent))) *
                m_kTurns[static_cast<size_t>(parent)];
     else if (role.part == EBodyPart::None && parent >= 0)

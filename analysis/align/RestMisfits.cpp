@@ -13,12 +13,12 @@ namespace gw {
 
 namespace {
 
-constexpr double kMisfit = 40.0; // degrees: an A-pose's legs and bent knees are less, a wrong frame is 90
+constexpr double kMisfit = 40.0; // in degrees: an A-pose's legs and bent knees are below, a wrong frame is 90
 
 struct BoneRow
 {
     const char* name;
-    bool planted; ///< planting lays it along the source's, so that the turn about it is all that counts
+    bool planted; ///< planting aligns it with the source's, so only its twist matters
 };
 constexpr BoneRow kBones[] = {
     {kTorsoBone,           false},

@@ -8,7 +8,7 @@ namespace gw {
 class CNode;
 class CRetargeter;
 
-/// A target bone that the source's rest pose would turn away from the target's, and by how many degrees.
+/// A target bone that the source's rest pose would rotate away from the target's, and the angle in degrees.
 struct RestMisfit
 {
     std::string target;
@@ -16,8 +16,8 @@ struct RestMisfit
     double degrees = 0.0;
 };
 
-/// The limbs and the neck that a retargeter's rows, offsets and all, turn by more than a profile would mean
-/// to when the source stands at rest. Trees need not be posed.
+/// Returns the limbs, and the neck, that a retargeter's rows with their offsets rotate by more than a profile
+/// would intend in the source's rest pose. Trees need not be posed.
 std::vector<RestMisfit> FindRestMisfits(const CRetargeter& table, CNode& targetRoot);
 
 } // namespace gw

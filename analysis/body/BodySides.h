@@ -23,6 +23,7 @@ struct LegsOfBody
     std::array<Leg, 2> legs; ///< left before right, as far as known
     bool standsAtRest = false;
 };
+/// Returns the joint indices of a body's legs and trunk.
 LegsOfBody LegsOf(const CJointTree& tree, const CBodyMap& body);
 
 /// Returns the stance in a pose of a tree.
@@ -32,7 +33,7 @@ BodyStance StanceIn(const CJointTree& tree, size_t stance, const CBodyMap& body)
 /// one), by up x forward. Forward is where the feet point, otherwise where the knees bend. A mean over all
 /// poses that show anything; 0 if none does.
 double JudgeSides(const CJointTree& tree, const LegsOfBody& body);
-/// From here on, either way, a verdict of JudgeSides or JudgeAlong is sure.
+/// A verdict of JudgeSides or JudgeAlong is certain if its absolute value is above this.
 inline constexpr double kSidesSure = 0.3;
 
 /// Same for a pair of joints that should be on the same sides as the thighs.

@@ -1,3 +1,6 @@
+// Precomputes what the search by shape asks for again and again: lengths, the longest path below each joint,
+// and the child on it. Joints are stored with parents before children, so one backward pass suffices.
+
 #include "CJointTree.h"
 
 #include "CNode.h"

@@ -13,9 +13,12 @@ class CJointTree
 public:
     static constexpr int kNone = -1;
 
+    /// Examines the rest pose and some frames of a skeleton, which must outlive the object. Restores its
+    /// pose.
     explicit CJointTree(CNode& root);
 
     const CStances& Stances() const { return m_kStances; }
+    /// Returns the node of a joint; null for kNone.
     CNode* Node(int joint) const { return joint == kNone ? nullptr : m_kStances.Joints()[At(joint)]; }
     int IndexOf(const CNode* node) const { return m_kStances.IndexOf(node); }
     int Count() const { return static_cast<int>(m_kJoints.size()); }
@@ -34,6 +37,7 @@ public:
     /// Returns a joint and its main children down to the end, at most `most` of them.
     std::vector<int> MainChain(int joint, size_t most) const;
     bool IsAtOrBelow(int joint, int ancestor) const;
+    /// Returns the lowest joint that has both joints at or below it.
     int CommonAncestor(int a, int b) const;
     /// Returns the joints on the path from one joint (excluded) down to another; empty if that is not below.
     std::vector<int> WayDown(int top, int bottom) const;

@@ -25,7 +25,7 @@ struct FoundBody
     CBodyMap body; ///< lacks the thirteen required joints if no body was found; see CBodyMap::DrivesBody
     std::array<EBodyEvidence, kBodyPlaceCount> evidence{}; ///< in the order of BodyPlaces()
     std::vector<BodyDoubt> doubts;                         ///< remaining doubts
-    bool sidesAreSure = true; ///< the names or the poses show which side is the left one
+    bool sidesAreSure = true;                              ///< names or poses show which side is the left one
 
     EBodyEvidence Evidence(BodyPlace place) const { return evidence[IndexOf(place)]; }
 };

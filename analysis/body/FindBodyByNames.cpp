@@ -57,7 +57,7 @@ CNamedJoints::CNamedJoints(CNode& root)
     for (const CNode* node : nodes)
         names.push_back(WithoutNamespace(node->NameView()));
     const std::string prefix = FindNamePrefix(names);
-    std::unordered_map<const CNode*, size_t> depths; // parents come first
+    std::unordered_map<const CNode*, size_t> depths; // parents precede their children
     for (size_t i = 0; i < nodes.size(); ++i)
     {
         const auto parent = depths.find(nodes[i]->GetParentNode());

@@ -153,7 +153,7 @@ FoundLimbs FindLimbs(const CJointTree& tree)
 // otherwise the last, unless that is only a marker at the top of the head.
 size_t FindHead(const CJointTree& tree, const std::vector<int>& chain, double leg)
 {
-    constexpr double kLongestNeckBone = 0.21; // of a leg; skulls are longer
+    constexpr double kLongestNeckBone = 0.21; // of a leg; skulls are longer than that
     constexpr double kSkullShare = 1.35;      // of the previous bone
     size_t last = 0;
     while (last + 1 < chain.size() && tree.Children(chain[last]).size() < 2)

@@ -22,7 +22,7 @@ namespace {
 // from many programs.
 struct Norms
 {
-    double ratio;        // natural logarithm of upper by lower bone
+    double ratio;        // natural logarithm of upper / lower bone length
     double before;       // distance before the upper bone, relative to both bones
     double beforeWeight; // if it is longer
     double behind;       // distance after the lower bone, relative to both bones
@@ -38,7 +38,7 @@ constexpr double kBendWeight = 4.0;
 constexpr double kShareWeight = 1.0;
 constexpr double kPassedJoint = 0.1;  // bones seldom contain joints
 constexpr double kPassedBranch = 0.5; // and never one where fingers or toes branch off
-constexpr double kAsLongBranch = 0.6; // of the longest; twist joints beside a bone reach half of it
+constexpr double kAsLongBranch = 0.6; // of the longest; twist joints in a bone reach half of it
 
 const Norms& NormsOf(ELimb limb)
 {
@@ -112,7 +112,7 @@ private:
 
     const CJointTree& tree_;
     const std::vector<int>& chain_;
-    std::vector<double> m_kWay; // from the first joint to each stop
+    std::vector<double> m_kWay; // path length from the first joint to each stop
 };
 
 LimbFit Judge(const CLine& line, const Norms& norms, const LimbJoints& joints)

@@ -31,7 +31,7 @@ struct LimbFit
 {
     LimbJoints joints;
     double cost = 0.0;
-    double length = 0.0; ///< upper and lower bone together
+    double length = 0.0; ///< total length of upper and lower bone
     bool found = false;
 };
 

@@ -71,7 +71,7 @@ constexpr Word kLexicon[] = {
     {"joint",    kJoint      },
     {"jnt",      kJoint      },
     {"bone",     kNothing    },
-    {"bend",     kNothing    }, // the half of a limb's bone that does not twist
+    {"bend",     kNothing    }, // the half of a limb bone that does not twist
     {"to",       kNothing    },
     {"hip",      kHip        },
     {"hips",     kHip        },
@@ -163,7 +163,7 @@ constexpr Meaning kSideMeanings[] = {
     {kFore | kFoot, kNothing, EJointWord::Toe     },
 };
 
-constexpr size_t kLongestToken = 48; // longer than any joint's words in a row
+constexpr size_t kLongestToken = 48; // longer than any joint name without separators
 
 // Returns the features of a run of letters that consists only of lexicon words, using as few as possible, so
 // that "upperarm" is not "up", "per" and "arm". Nothing if it contains anything else.

@@ -17,7 +17,7 @@ constexpr size_t kLeastJoints = 2;
 // Of the longest path through the tree. Arms are a third of it, even next to a long object in a hand.
 constexpr double kLeastReach = 0.08;
 // Real skeletons differ between left and right.
-constexpr double kMostDifference = 0.25; // of the longer of two bones
+constexpr double kMostDifference = 0.25; // of the longer of both bones
 constexpr double kAnyDifference = 0.03;  // of the whole limb: short bones can differ a lot
 
 std::vector<int> LongBranches(const CJointTree& tree, int joint)

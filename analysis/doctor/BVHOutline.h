@@ -21,8 +21,8 @@ struct OutlineJoint
     size_t line = 0;           ///< line of its name
     size_t offsetLine = 0;
     Vec3 offset = kVec3Zero;
-    std::vector<int> channels; ///< indices of kChannelNames, or kNoChannel for an unknown name
-    size_t firstColumn = 0;    ///< of its channels in a row
+    std::vector<int> channels; ///< indices into kChannelNames, or kNoChannel for an unknown name
+    size_t firstColumn = 0;    ///< first of its columns in a row
 };
 
 /// The text of a BVH file before its rows, as far as it can be understood.

@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// One fault of a file, at one place.
+/// One fault at one place in a file.
 struct Finding
 {
     EFault fault = EFault::Reader;

@@ -7,7 +7,7 @@
 
 namespace gw {
 
-/// A cursor over the lines of a text in memory.
+/// Iterates over the lines of a text in memory.
 class CLineCursor
 {
 public:

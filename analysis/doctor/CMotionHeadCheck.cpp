@@ -1,3 +1,6 @@
+// Checks "Frames:" and "Frame Time:", which the strict reader requires literally. Misspelled keywords are
+// reported and repaired, and a frame time that is really a rate is recognized by its size.
+
 #include "CMotionHeadCheck.h"
 
 #include "CFindings.h"

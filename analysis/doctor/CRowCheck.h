@@ -18,7 +18,7 @@ class CFindings;
 /// What a repaired copy does with the rows, apart from the changed values.
 struct RowPlan
 {
-    size_t rowCount = 0;            ///< rows of the copy, which are the first ones of the text
+    size_t rowCount = 0;            ///< the copy keeps this many rows from the start of the text
     bool dropsLast = false;         ///< leaves out the row after them
     bool correctsCount = false;     ///< sets the frame count to rowCount
     std::vector<float> subtrahends; ///< per column, the number to subtract from its values; empty if unused
@@ -72,7 +72,7 @@ private:
     size_t m_uiFirstEmptyLine = 0;      // of those not yet reported, since it is unknown whether rows follow
     size_t m_uiEmptyLines = 0;
     size_t m_uiShortLine = 0; // line of the previous row if that was short, otherwise 0
-    size_t m_uiRows = 0;      // of all kinds
+    size_t m_uiRows = 0;      // all rows, complete or not
 };
 
 } // namespace gw

@@ -1,3 +1,9 @@
+// The mender copies the rows and changes only what the plan names, so a mended file differs from the
+// original in as few bytes as possible. It walks over the text and the list of replaced cells in parallel.
+// Both are in row order, so one pass over each is enough. Values without a change are copied as they are
+// written, because printing a parsed number again could change digits. Output is written in blocks of a
+// megabyte, so memory does not grow with the file.
+
 #include "CRowMender.h"
 
 #include "BVHOutline.h"

@@ -28,7 +28,7 @@ private:
     {
         size_t begin;
         size_t length;
-        size_t firstInstead; // in m_kInstead
+        size_t firstInstead; // offset in m_kInstead
         size_t insteadLength;
     };
 

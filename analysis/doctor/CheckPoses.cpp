@@ -22,9 +22,9 @@ namespace gw {
 
 namespace {
 
-constexpr double kLeastTravelShare = 0.1; // of the longest bone: what a joint below a still root must move
+constexpr double kLeastTravelShare = 0.1; // of the longest bone: least motion below a still root
 
-// The largest distance from the first position that a track has.
+// Returns the largest distance of a track from its first position.
 double Travel(const CKeyframeControl& track)
 {
     double travel = 0.0;
@@ -74,7 +74,7 @@ public:
         }
     }
 
-    // What the names say of left and right, against the places of the legs or arms.
+    // Compares left and right in the names with the positions of legs or arms.
     void CheckSides()
     {
         const CBodyMap named = FindBodyByNames(root_);
@@ -85,7 +85,7 @@ public:
             Add(EFault::SidesSwapped, *joint);
     }
 
-    // A rate in place of a time needs no gait to be seen.
+    // A rate written in place of a frame time shows even without a gait.
     void CheckRate(const BodyPaths& paths, const Vec3& up, const MotionFacts& facts)
     {
         const std::optional<Gait> gait = FindGait(paths, up, facts.leg);

@@ -8,9 +8,9 @@ class CFindings;
 struct BVHOutline;
 class CMotionFile;
 
-/// What can be told of a motion only when it moves: a root that stands still, a rate that does not go with
-/// the steps, sides that are swapped. Answers what is known of it beside. The motion must be loaded; leaves
-/// its tree posed. The outline of its text tells lines; null where there is none.
+/// Returns the facts about a motion, and finds faults that are visible only when it moves: a root that does
+/// not move, a rate that does not match the steps, swapped sides. The motion must be loaded; its tree is left
+/// posed. `outline` supplies the lines of findings and may be null.
 MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFindings& findings);
 
 } // namespace gw

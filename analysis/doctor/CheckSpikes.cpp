@@ -1,3 +1,6 @@
+// Searches all joints of a file for spikes (FindSpikes) and repairs those of one frame. Longer ones are only
+// reported, because the true motion in between is unknown.
+
 #include "CheckSpikes.h"
 
 #include "BVHOutline.h"

@@ -119,7 +119,7 @@ private:
     void JudgeControl()
     {
         const size_t length =
-            std::min(m_kRest.find_first_not_of(m_kRest.front()), m_kRest.size()); // a run is one finding
+            std::min(m_kRest.find_first_not_of(m_kRest.front()), m_kRest.size()); // one finding for a run
         Replace(EFault::StrayCharacter, length, length == m_kRest.size() ? "" : " ",
                 Printable(m_kRest.substr(0, 1)));
     }

@@ -1,3 +1,6 @@
+// The table of faults: code, severity, text, remedy, and whether a repaired copy can fix it. Codes are read
+// by programs and never change.
+
 #include "Fault.h"
 
 #include <cstddef>
@@ -25,8 +28,7 @@ using enum ESeverity;
 constexpr FaultRow kFaults[] = {
     Told(Reader, "reader", Error, "the file cannot be read", "export the file again"),
 
-    Told(LfsPointer, "lfs-pointer", Error,
-         "this is a Git LFS pointer, not the motion itself",
+    Told(LfsPointer, "lfs-pointer", Error, "this is a Git LFS pointer, not the motion itself",
          "fetch the file with 'git lfs pull'"),
     Told(NotText, "not-text", Error, "not plain text (binary or UTF-16)",
          "save it as plain text, or copy it again"),
@@ -50,8 +52,7 @@ constexpr FaultRow kFaults[] = {
          "correct the number after CHANNELS"),
     Told(UnknownChannel, "unknown-channel", Error, "unknown channel name; it is ignored in the rows",
          "use Xposition to Zposition and Xrotation to Zrotation"),
-    Told(SecondRoot, "second-root", Warning, "a second ROOT; it is not read",
-         "export one skeleton per file"),
+    Told(SecondRoot, "second-root", Warning, "a second ROOT; it is not read", "export one skeleton per file"),
 
     Mended(EmptyLineBeforeFrames, "empty-line-before-frames", Error,
            "an empty line between MOTION and the rows", "remove the empty line"),
@@ -67,8 +68,7 @@ constexpr FaultRow kFaults[] = {
            "set the number after Frames to the number of rows"),
     Told(NoFrames, "no-frames", Warning, "no frames, so there is nothing to convert",
          "export the motion again"),
-    Mended(ShortRow, "short-row", Error,
-           "a row has too few values, so all rows after it are misread",
+    Mended(ShortRow, "short-row", Error, "a row has too few values, so all rows after it are misread",
            "export the file again, or delete the row if it is the last"),
     Told(LongRow, "long-row", Error, "a row has more values than the joints have channels",
          "make sure that the hierarchy lists all joints and channels"),

@@ -70,6 +70,7 @@ struct FaultRow
 
 /// Returns all faults, in EFault order.
 std::span<const FaultRow> FaultTable();
+/// Returns the properties of a fault.
 const FaultRow& RowOf(EFault fault);
 /// Returns "error", "warning" or "note".
 std::string_view SeverityName(ESeverity severity);

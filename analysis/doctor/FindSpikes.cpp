@@ -97,7 +97,7 @@ private:
 
     std::span<const Key> m_kKeys;
     double m_fLeast;
-    std::vector<float> m_kSteps; // from each frame to the next
+    std::vector<float> m_kSteps; // distance from each frame to the next
 };
 
 } // namespace

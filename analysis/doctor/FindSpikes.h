@@ -12,8 +12,8 @@ namespace gw {
 /// Frames in which a joint has jumped out of its motion; it is back in the frame after them.
 struct Spike
 {
-    size_t first; ///< frame
-    size_t count; ///< 1 or 2
+    size_t first; ///< first frame
+    size_t count; ///< number of frames, 1 or 2
 };
 
 /// The minimum rotation of a spike: twice what a fast limb rotates per frame at usual rates.

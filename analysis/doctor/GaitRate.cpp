@@ -20,7 +20,7 @@ namespace gw {
 namespace {
 
 constexpr double kWalkRatio = 0.0065; // meters, for a step per minute
-constexpr double kLegMetres = 0.82;   // thigh and shin of an adult
+constexpr double kLegMetres = 0.82;   // thigh plus shin of an adult
 constexpr double kSlowest = 70.0;     // steps per minute: a stroll
 constexpr double kFastest = 220.0;    // a sprint
 constexpr double kMostApart = 2.0;    // rates that differ by this factor are different rates
@@ -29,8 +29,8 @@ constexpr size_t kLeastSteps = 4;
 constexpr double kLeastSpread =
     // of the leg: how much further apart the feet are in a step than side by side
     0.3;
-constexpr double kLeastStep = 0.35;     // of the leg: shorter ones are a dance or a turn
-constexpr double kMostStep = 2.2;       // longer ones are jumps
+constexpr double kLeastStep = 0.35;     // of the leg: shorter steps are a dance or a turn
+constexpr double kMostStep = 2.2;       // longer steps are jumps
 constexpr double kMostVariation = 0.25; // standard deviation by mean, of durations and lengths
 // the standing foot moves at most this share of the other foot's movement
 constexpr double kStandingShare = 0.4;

@@ -10,7 +10,7 @@ namespace gw {
 
 class CMotionFile;
 
-/// How the joints of a body were found.
+/// How the joints of a body were identified.
 enum class EBodySource : uint8_t
 {
     None,
@@ -23,10 +23,10 @@ struct MotionFacts
 {
     size_t jointCount = 0;
     size_t frameCount = 0;
-    double frameSeconds = 0.0;
-    double leg = 0.0;      ///< thigh and shin in file units; 0 if unknown
-    std::string_view unit; ///< the unit suggested by the leg's length; empty if none fits
-    std::string_view up;   ///< "Y" or "-Z"; empty if hip or feet are unknown
+    double frameSeconds = 0.0; ///< time between frames
+    double leg = 0.0;          ///< thigh and shin in file units; 0 if unknown
+    std::string_view unit;     ///< the unit suggested by the leg's length; empty if none fits
+    std::string_view up;       ///< "Y" or "-Z"; empty if hip or feet are unknown
     ERestPose restPose = ERestPose::Unknown;
     EBodySource body = EBodySource::None;
 };

@@ -1,3 +1,6 @@
+// Selects poses in which a body can be judged. A rest pose that is not a standing pose (bones along one axis,
+// arms overhead) says nothing, so frames of the motion replace it.
+
 #include "CBodyPoses.h"
 
 #include "BoneMeshQueries.h"

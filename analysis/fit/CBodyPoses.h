@@ -23,6 +23,7 @@ public:
 
     /// Watches a node. Call it for all nodes before the first pose.
     void Watch(CNode* node);
+    /// Returns the number of poses, at least 1.
     size_t Count() const { return m_kFrames.empty() ? 1 : m_kFrames.size(); }
     /// Poses the tree; the first pose is 0.
     void Take(size_t pose);
@@ -30,6 +31,7 @@ public:
     // In the current pose.
     /// Returns the world matrix of a watched node, or of its bone mesh if it has one.
     Mat4 BoneWorld(const CNode& node) const;
+    /// Returns the world position of a watched node.
     Vec3 Place(const CNode& node) const { return World(node).Translation(); }
     /// Returns the body's own axes as rows: left, up from the legs to the arms, forward.
     Mat3 Axes() const;

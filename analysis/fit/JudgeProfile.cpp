@@ -1,3 +1,7 @@
+// Judges a profile that matches by name. Names are not enough: a profile of another program can find all its
+// bones and still drive an arm with a clavicle. So the joints are checked as a body, compared with what their
+// names mean, and the rotation that the offsets produce at rest is measured.
+
 #include "JudgeProfile.h"
 
 #include "BodyJoints.h"

@@ -50,7 +50,7 @@ struct ProfileVerdict
 {
     ESureness sureness = ESureness::Sure;
     std::vector<ProfileDoubt> doubts;
-    size_t leftOut = 0; ///< spine joints above the one that drives the upper torso
+    size_t leftOut = 0; ///< number of spine joints above the one that drives the upper torso
     double turn = 0.0;  ///< mean misrotation of the bones in degrees
 };
 

@@ -1,3 +1,6 @@
+// Profiles as rows in memory, as loading them in the editor would leave them, and variants with another name
+// prefix. MayFit stops at the first missing bone, which makes choosing among many profiles cheap.
+
 #include "ProfileRows.h"
 
 #include "FindBone.h"

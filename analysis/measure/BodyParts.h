@@ -5,18 +5,18 @@
 
 namespace gw {
 
-/// A part of the body and the bones of the target skeleton that make it, both sides taken together.
+/// A part of the body, and the target bones that belong to it, on both sides.
 struct BodyPart
 {
-    std::string_view name; ///< as people say it: "upper arm"
+    std::string_view name; ///< its usual name: "upper arm"
     std::span<const std::string_view> bones;
 };
 
-/// The parts whose bones carry a pose: what is left out (collars, hands, feet, toes) is short, or is looked
-/// at in other ways.
+/// Returns the parts whose bones determine a pose. The others (collars, hands, feet, toes) are short, or are
+/// measured differently.
 std::span<const BodyPart> BodyParts();
 
-/// Whether a bone of the target skeleton belongs to one of the parts: a main bone.
+/// Returns whether a target bone belongs to one of the parts, that is, is a main bone.
 bool IsMainBone(std::string_view target);
 
 } // namespace gw

@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-// The first mapped bone at or below a node, depth first.
+// Returns the first mapped bone at or below a node, depth first.
 CNode* FirstMapped(CNode& node, const CSourceTable& sources)
 {
     if (sources.SourceOf(&node))
@@ -22,8 +22,8 @@ CNode* FirstMapped(CNode& node, const CSourceTable& sources)
     return mapped;
 }
 
-// How far sideways a node lies from another in the rest pose, as a share of their distance. Nodes at one
-// place count as far: a hip's helper says nothing of the way that the leg takes.
+// Returns a node's sideways distance from another in the rest pose, relative to their distance. Nodes at the
+// same place count as far: a helper at the hip does not show the leg's direction.
 double SidewaysShare(const CNode& from, const CNode& to)
 {
     const Vec3 offset = RestWorld(to).Translation() - RestWorld(from).Translation();
@@ -31,7 +31,7 @@ double SidewaysShare(const CNode& from, const CNode& to)
     return length > 0.0 ? std::fabs(static_cast<double>(offset.x)) / length : 1.0;
 }
 
-// The mapped bone that a target bone leads to, or null.
+// Returns the mapped bone that a target bone leads to, or null.
 CNode* NextMapped(const CNode& target, const CSourceTable& sources)
 {
     CNode* next = nullptr;
@@ -48,8 +48,8 @@ CNode* NextMapped(const CNode& target, const CSourceTable& sources)
     return next;
 }
 
-// The nearest node at or above a source bone that has the next bone's source below it: the bone itself where
-// the rows follow the skeleton, the chest where a collar drives the torso and the next bone is the neck.
+// Returns the closest node at or above a source bone that has the next bone's source below it: usually the
+// bone itself, but the chest if a collar drives the torso and the next bone is the neck.
 CNode* SourceStart(CNode& source, const CNode* next)
 {
     CNode* start = &source;

@@ -6,16 +6,16 @@ class CNode;
 class CSourceTable;
 struct BonePair;
 
-/// The joints that the directions of a pair of bones lead to; null where a side's bone is an end joint.
+/// The joints that define the directions of a pair of bones; null if a side's bone is an end joint.
 struct BoneEnds
 {
     CNode* target = nullptr;
     CNode* source = nullptr;
-    CNode* sourceStart = nullptr; ///< where the source's direction begins; never null
+    CNode* sourceStart = nullptr; ///< start of the source's direction; never null
 };
 
-/// Finds them by the rule of BoneMeasures. Both trees are posed, so that helper joints at the place of their
-/// parents can be told and passed over.
+/// Finds them by the rule of BoneMeasures. Both trees must be posed, so that helper joints at their parents'
+/// place can be recognized and skipped.
 BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources);
 
 } // namespace gw

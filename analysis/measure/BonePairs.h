@@ -10,36 +10,36 @@ namespace gw {
 
 class CNode;
 
-/// A bone of the result and the source bone that drives it. Neither is null, neither is kept alive.
+/// A bone of the result and the source bone that drives it. Neither is null or kept alive.
 struct BonePair
 {
     CNode* target = nullptr;
     CNode* source = nullptr;
 };
 
-/// A mapping row of which a bone is missing.
+/// A mapping row with a missing bone.
 struct PairMisfit
 {
-    size_t line = 0; ///< in the profile, from 1 on
+    size_t line = 0; ///< in the profile, starting at 1
     std::string source;
     std::string target;
     bool sourceFound = false;
     bool targetFound = false;
 };
 
-/// Reads which bones a profile pairs, in the order of its rows; of two rows for one target the later one
-/// counts, and fixed rows pair nothing. Rows that do not fit go into `misfits`. False, and nothing is
-/// changed, when the profile cannot be read.
+/// Reads the bone pairs of a profile, in row order. If a target has two rows, the later one counts; fixed
+/// rows pair nothing. Rows that do not fit go to `misfits`. Returns false, changing nothing, if the profile
+/// cannot be read.
 bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
                    std::vector<BonePair>& pairs, std::vector<PairMisfit>& misfits);
 
-/// Pairs by target.
+/// Maps targets to their sources.
 class CSourceTable
 {
 public:
     explicit CSourceTable(std::span<const BonePair> pairs);
 
-    /// The source of a target bone, or null.
+    /// Returns the source of a target bone, or null.
     CNode* SourceOf(const CNode* target) const;
 
 private:

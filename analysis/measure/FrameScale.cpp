@@ -8,12 +8,12 @@ namespace gw {
 
 namespace {
 
-constexpr int kScaleRate = 120;    // a result is saved with this by its profile's rate as frame scale
+constexpr int kScaleRate = 120;    // a saved result's frame scale is this divided by its profile's rate
 constexpr int kHighestRate = 1200; // of a profile, faster than any recording
-// The rates in use share many factors with this: 24, 25, 30, 50, 60, 100, 120, 150, 240 divide it.
+// The usual rates (24, 25, 30, 50, 60, 100, 120, 150, 240) divide this number.
 constexpr int kRoundRate = 1200;
 
-// The frames of a result saved by a profile's rate, cut in 32 bits as the writer does.
+// Returns the number of frames of a result saved with a profile's rate, truncated in 32 bits like the writer.
 int64_t SavedFrames(int sourceFrames, int rate)
 {
     const float scale = static_cast<float>(kScaleRate) / static_cast<float>(rate);

@@ -16,9 +16,9 @@ struct LegPair
     LegJoints result;
 };
 
-/// The legs whose foot, LFoot or RFoot, is mapped, in the order of the pairs. Knee and thigh are the two
-/// joints above the ankle; in the source they are those that drive the result's, where these are mapped. Both
-/// trees are posed.
+/// Returns the legs whose foot, LFoot or RFoot, is mapped, in pair order. Knee and thigh are the two joints
+/// above the ankle; in the source, the joints that drive the result's, if these are mapped. Both trees must
+/// be posed.
 std::vector<LegPair> FindLegs(std::span<const BonePair> pairs, const CSourceTable& sources);
 
 } // namespace gw

@@ -7,7 +7,7 @@ namespace gw {
 
 namespace {
 
-// The round step, 1, 2 or 5 times a power of ten, that goes into a range about `count` times.
+// Returns the round step (1, 2 or 5 times a power of ten) that divides a range into about `count` steps.
 double RoundStep(double range, int count)
 {
     const double rough = range / count;
@@ -24,7 +24,7 @@ double RoundStep(double range, int count)
 
 CAxis::CAxis(double least, double largest, int count)
 {
-    // Curves are 32 bits: below their rounding a range is that of a curve that stands still.
+    // Curves are 32-bit: a range below their rounding is that of a constant curve.
     const double smallest = std::max(1e-6 * std::max(std::fabs(least), std::fabs(largest)), 1e-3);
     if (largest - least < smallest)
     {

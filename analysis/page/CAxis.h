@@ -8,14 +8,14 @@ namespace gw {
 class CAxis
 {
 public:
-    /// Holds all numbers from `least` through `largest` and has about `count` steps.
+    /// Contains all numbers from `least` to `largest` in about `count` steps.
     CAxis(double least, double largest, int count);
 
-    /// The round numbers, from the low end to the high one.
+    /// Returns the round numbers from the low end to the high end.
     std::vector<double> Ticks() const;
-    /// Decimals that tell one tick from the next.
+    /// Returns the number of decimals that distinguishes ticks.
     int Decimals() const { return m_iDecimals; }
-    /// Where a number lies between the ends, 0 to 1.
+    /// Returns the position of a number between the ends, 0 to 1.
     double Share(double value) const { return (value - m_fLow) / (m_fHigh - m_fLow); }
 
 private:

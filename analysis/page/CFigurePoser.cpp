@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kMostJoints = 1000; // hands and faces with all that is in them; more is a tangle
+constexpr size_t kMostJoints = 1000; // includes detailed hands and faces; more would only be a tangle
 
 std::vector<CNode*> PathTo(CNode* node)
 {
@@ -22,7 +22,7 @@ std::vector<CNode*> PathTo(CNode* node)
     return path;
 }
 
-// The lowest node at or above all of the named ones.
+// Returns the lowest node at or above all named ones.
 CNode* CommonRoot(CNode* root, const std::vector<std::string>& bones)
 {
     std::vector<CNode*> common;
@@ -43,7 +43,7 @@ bool IsFinite(const Vec3& v)
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
 }
 
-// The end of a bone that has no joint there.
+// Returns the end of a bone that has no joint there.
 std::optional<Vec3> FreeEnd(const CNode& node)
 {
     const CBoneMesh* mesh = FindBoneMesh(node);
@@ -52,7 +52,7 @@ std::optional<Vec3> FreeEnd(const CNode& node)
     return TransformCoord(mesh->Axis() * mesh->m_fLength, mesh->m_kMatrix * node.m_kWorldMatrix);
 }
 
-// The joints whose bones below are at fault, the one that shows it first.
+// Returns the joints above the faulty bones, starting with the one that shows the fault.
 std::vector<const CNode*> BadJoints(EFrameFault fault, const CNode* bone)
 {
     if (!bone || fault != EFrameFault::KneePop)

@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kLongestName = 300; // the system's own limit for the name of a file is 255
+constexpr size_t kLongestName = 300; // file systems limit names to 255 bytes
 
 std::string_view EscapeOf(char c)
 {
@@ -35,7 +35,7 @@ std::string_view EscapeOf(char c)
 
 CMarkup& CMarkup::Name(std::string_view name)
 {
-    // A character that is cut in two shows its bytes.
+    // A character that is cut in two is shown as bytes.
     for (const char c : Printable(name.substr(0, kLongestName)))
     {
         const std::string_view escape = EscapeOf(c);

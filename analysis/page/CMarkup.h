@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// The text of a page as it grows. Markup is taken as it is; whatever comes from a file goes through Name.
+/// The growing text of a page. Markup is appended unchanged; text from files must go through Name.
 class CMarkup
 {
 public:
@@ -14,10 +14,10 @@ public:
         m_kText += markup;
         return *this;
     }
-    /// A name from a file as text or between the quotes of an attribute: nothing in it can be markup, control
-    /// characters and bytes that are no UTF-8 stand as \xNN, and a very long one is cut.
+    /// Appends a name from a file as text or inside a quoted attribute: markup is escaped, control characters
+    /// and bytes that are not UTF-8 become \xNN, and very long names are cut.
     CMarkup& Name(std::string_view name);
-    /// The name of the file that a path leads to, with the whole path behind it for whoever points there.
+    /// Appends the file name of a path, with the whole path in its tool tip.
     CMarkup& FileName(std::string_view path);
     CMarkup& Number(double value, int decimals);
     CMarkup& Integer(long long value);

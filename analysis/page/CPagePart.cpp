@@ -13,13 +13,13 @@ namespace gw {
 
 namespace {
 
-// Points of one curve: two for each pixel of a wide screen at most, and for many motions so few that a
-// thousand of them make some dozen megabytes.
+// Points per curve: at most two per pixel of a wide screen, and with many motions few enough that a thousand
+// of them make some dozen megabytes.
 constexpr size_t kMostPoints = 2000;
 constexpr size_t kLeastPoints = 200;
 constexpr size_t kPointsOfPage = 40000;
 
-// Stands in no markup: control characters of names are written out.
+// cannot occur in markup, because control characters of names are escaped
 constexpr char kDivider = '\0';
 
 size_t PointsFor(size_t motionCount)

@@ -8,30 +8,30 @@ namespace gw {
 
 struct ConvertedMotion;
 
-/// What a page shows of one conversion. It is made where the trees of the conversion are, and may go to the
-/// page as text, from another process too.
+/// The page's content for one conversion. It is created where the conversion's trees are, and can be sent to
+/// the page as text from another process.
 class CPagePart
 {
 public:
-    /// `number` is the conversion's own among those of the page, from 1 on. `motionCount` is how many there
-    /// will be: the more, the coarser are the curves, so that a browser can open the page.
+    /// `number` identifies the conversion on the page, starting at 1. `motionCount` is the total number: the
+    /// more, the coarser the curves, so that a browser can open the page.
     CPagePart(size_t number, size_t motionCount);
 
-    /// Draws a conversion; its trees are posed anew.
+    /// Draws a conversion; its trees are posed.
     void Show(const ConvertedMotion& motion);
 
-    /// Whether a conversion was drawn.
+    /// Returns whether a conversion was drawn.
     bool HasFigures() const { return !m_kSection.empty(); }
-    /// The conversion's row of the table of all.
+    /// Returns the conversion's row in the overview table.
     const std::string& Row() const { return m_kRow; }
-    /// All that the page has about the conversion.
+    /// Returns the section about the conversion.
     const std::string& Section() const { return m_kSection; }
-    /// How bad it is beside others: larger is worse.
+    /// Returns how bad the conversion is compared with others: larger is worse.
     double Badness() const { return m_fBadness; }
 
-    /// The part as text, for FromText of another one; empty for one without figures.
+    /// Returns the part as text for FromText; empty for one without figures.
     std::string ToText() const;
-    /// False for any other text.
+    /// Restores a part; false for any other text.
     bool FromText(std::string_view text);
 
 private:

@@ -15,7 +15,7 @@ namespace gw {
 
 namespace {
 
-// std::tmpfile ignores the user's choice of a folder.
+// std::tmpfile ignores TMPDIR.
 std::FILE* OpenNameless()
 {
     std::error_code error;
@@ -43,14 +43,14 @@ CSpool::~CSpool()
 void CSpool::Write(std::string_view text)
 {
     if (m_pkFile)
-        std::fwrite(text.data(), 1, text.size(), m_pkFile); // a failure stays in the stream's error mark
+        std::fwrite(text.data(), 1, text.size(), m_pkFile); // a failure is kept in the stream's error flag
 }
 
 bool CSpool::CopyTo(CSafeFile& file)
 {
     if (!m_pkFile || std::fflush(m_pkFile) != 0 || std::ferror(m_pkFile))
         return false;
-    std::rewind(m_pkFile); // takes the mark away
+    std::rewind(m_pkFile); // clears the flag
     std::array<char, size_t{1} << 16> buffer;
     while (const size_t count = std::fread(buffer.data(), 1, buffer.size(), m_pkFile))
     {

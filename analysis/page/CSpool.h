@@ -8,8 +8,8 @@ namespace gw {
 
 class CSafeFile;
 
-/// Text that waits in a nameless temporary file (under TMPDIR) until what stands before it is known: a page
-/// of hundreds of motions need not lie in memory.
+/// Text kept in an unnamed temporary file (under TMPDIR) until the text before it is known, so that a page of
+/// hundreds of motions does not need to fit into memory.
 class CSpool
 {
 public:
@@ -19,11 +19,11 @@ public:
     CSpool& operator=(const CSpool&) = delete;
 
     void Write(std::string_view text);
-    /// Copies all that was written. False when the file system failed on either side, now or before.
+    /// Copies everything written. Returns false if reading or writing has failed at any time.
     bool CopyTo(CSafeFile& file);
 
 private:
-    std::FILE* m_pkFile; // null where there is no room for temporary files
+    std::FILE* m_pkFile; // null if the file could not be created
 };
 
 } // namespace gw

@@ -1,5 +1,5 @@
-// The drawing of a chart stretches with the page: its lines keep their width, and the numbers at its axes are
-// text of the page, so that they keep their size on a phone and on a wide screen alike.
+// A chart scales with the page: its lines keep their width, and the numbers on its axes are text of the page,
+// so they keep their size on phones and wide screens alike.
 
 #include "Chart.h"
 
@@ -51,7 +51,7 @@ CAxis HeightAxis(const Chart& chart, const std::vector<ThinnedCurve>& curves)
     return least <= largest ? CAxis(least, largest, kHeightSteps) : CAxis(0.0, 1.0, kHeightSteps);
 }
 
-// One chart on its way into the page.
+// Draws one chart.
 class CChartDrawing
 {
 public:
@@ -101,7 +101,7 @@ private:
             page_.Raw("M0 ").Number(Y(tick), 2).Raw("H1000");
         page_.Raw("\"/>");
     }
-    // The strips lie one over the other at the bottom, the first one highest.
+    // Strips are stacked at the bottom, the first one on top.
     void DrawStrips()
     {
         double top = kHeight - kStripHeight * static_cast<double>(chart_.strips.size());
@@ -134,7 +134,7 @@ private:
             command = "L";
         }
         if (curve.points.size() == 1)
-            page_.Raw("h1000"); // a pose without motion
+            page_.Raw("h1000"); // a single frame
         page_.Raw("\"/>");
     }
     void LabelHeights()
@@ -145,7 +145,7 @@ private:
             page_.Number(tick, m_kHeight.Decimals()).Raw("</span>");
         }
     }
-    // The axis goes on to a round number; the motion need not.
+    // The axis ends at a round number, which can be after the motion's end.
     void LabelFrames()
     {
         for (const double tick : CAxis(0.0, m_fLastFrame, kFrameSteps).Ticks())

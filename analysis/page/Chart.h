@@ -12,7 +12,7 @@ namespace gw {
 
 class CMarkup;
 
-/// A curve over the frames of a motion. Style is a class of the page: "source", "result", or another.
+/// A curve over the frames of a motion. `style` is a CSS class of the page: "source", "result" or another.
 struct ChartCurve
 {
     std::string_view name;
@@ -20,7 +20,7 @@ struct ChartCurve
     std::span<const float> values;
 };
 
-/// Stretches of frames in which something holds, as a strip under the curves.
+/// Ranges of frames with a property, drawn as a strip below the curves.
 struct ChartStrip
 {
     std::string_view name;
@@ -28,26 +28,25 @@ struct ChartStrip
     std::span<const Contact> stretches;
 };
 
-/// A frame that the worst frames of the page show, under its number there.
+/// A frame that is one of the page's worst frames, with its number there.
 struct ChartMark
 {
     int frame;
     size_t number;
 };
 
-/// Curves over time on common axes.
+/// Curves over time with common axes.
 struct Chart
 {
-    std::string title; ///< escaped by the chart
+    std::string title; ///< escaped when the chart is drawn
     std::string_view unit;
     std::vector<ChartCurve> curves;
     std::vector<ChartStrip> strips;
     std::span<const ChartMark> marks;
-    bool fromZero = false; ///< 0 stands on the axis, whatever the curves do
+    bool fromZero = false; ///< include 0 on the axis, whatever the curves' range is
 };
 
-/// Appends a chart; nothing where no curve has a frame. Curves are drawn in at most about `mostPoints`
-/// points.
+/// Appends a chart; nothing if no curve has a frame. Curves are drawn with at most about `mostPoints` points.
 void AppendChart(CMarkup& page, const Chart& chart, size_t mostPoints);
 
 } // namespace gw

@@ -8,23 +8,24 @@
 
 namespace gw {
 
-/// All that was measured of a conversion.
+/// All measures of a conversion.
 struct MeasuredConversion
 {
     ConversionMeasures sums;
     ConversionDetail detail;
 };
 
-/// A conversion as a page tells of it. What is pointed to must live while the page takes it.
+/// A conversion for a page. Referenced objects must exist while the page reads it.
 struct ConvertedMotion
 {
-    std::string source; ///< paths, as the user knows them
+    std::string source; ///< paths, as given by the user
     std::string result;
-    std::string profile; ///< display name, or a path
+    std::string profile; ///< display name or path
     MotionClip sourceClip;
     MotionClip resultClip;
     const MeasuredConversion* measured = nullptr;
-    const MeasuredConversion* plain = nullptr; ///< the same motion by the plain rules; null where it is that
+    /// the same motion without options; null if there are no options
+    const MeasuredConversion* plain = nullptr;
 };
 
 } // namespace gw

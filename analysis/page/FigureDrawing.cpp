@@ -9,7 +9,7 @@ namespace gw {
 
 namespace {
 
-// All drawings of a page are of one size; what the figures need of it decides how large they are.
+// All drawings of a page have the same size; figures are scaled to fit.
 constexpr double kWidth = 260.0;
 constexpr double kHeight = 200.0;
 constexpr double kMargin = 8.0;
@@ -40,13 +40,13 @@ void EachPoint(const FigurePair& pair, const Visit& visit)
     }
 }
 
-// One look at the figures. The origin, under their roots on the floor, is always in sight.
+// A view of the figures. The origin, on the floor under their roots, is always visible.
 struct Look
 {
-    Vec3 right; ///< unit, over the ground
+    Vec3 right; ///< horizontal unit vector
     Range across;
     Range height;
-    double scale = 1.0; ///< drawing to figure
+    double scale = 1.0; ///< drawing units per figure unit
 
     Look(const FigurePair& pair, const Vec3& direction) : right(direction)
     {

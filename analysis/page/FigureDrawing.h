@@ -6,20 +6,20 @@ namespace gw {
 
 class CMarkup;
 
-/// The same moment of both sides.
+/// The same moment on both sides.
 struct FigurePair
 {
     PosedFigure source;
     PosedFigure result;
-    Vec3 across; ///< unit, over the ground: towards the body's left
+    Vec3 across; ///< horizontal unit vector toward the body's left
 };
 
-/// Brings a figure to where pictures of both sides can stand beside each other: over the origin, above the
-/// floor, in the size of the result.
+/// Moves a figure so that drawings of both sides are comparable: above the origin, on the floor, scaled to
+/// the result.
 void PlaceFigure(PosedFigure& figure, double floor, double scale);
 
-/// Appends four drawings: source and result from the front, source and result from the figure's right side;
-/// all in one scale, with the floor. Nothing is appended where the figures have no extent.
+/// Appends four drawings: source and result from the front, then both from the figure's right side, all with
+/// one scale and the floor. Nothing if the figures have no extent.
 void AppendFigures(CMarkup& page, const FigurePair& pair);
 
 } // namespace gw

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// The text of Page.css, which every page carries within.
+/// The text of Page.css, which is embedded in every page.
 extern const std::string_view kPageStyle;
 
 } // namespace gw

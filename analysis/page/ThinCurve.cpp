@@ -31,7 +31,7 @@ void AddStretch(std::span<const float> values, size_t begin, size_t end, std::ve
 
 std::vector<CurvePoint> ThinCurve(std::span<const float> values, size_t most)
 {
-    // Two points a stretch; a curve that fits has stretches of one frame.
+    // Two points per range; if the curve fits, each range is one frame.
     const size_t stretches = values.size() <= most ? values.size() : std::max<size_t>(most / 2, 1);
     std::vector<CurvePoint> points;
     for (size_t i = 0; i < stretches; ++i)

@@ -6,16 +6,15 @@
 
 namespace gw {
 
-/// A point of a curve: what it is in a frame.
+/// A point of a curve: its value in a frame.
 struct CurvePoint
 {
     int frame;
     float value;
 };
 
-/// A curve in at most about `most` points: the least and the largest value of each stretch of frames, in
-/// their order, so that no peak is lost. A short curve is taken whole. Numbers that are not finite are left
-/// out.
+/// Reduces a curve to at most about `most` points: the minimum and maximum of each range of frames, in their
+/// order, so that no peak is lost. A short curve is kept complete. Numbers that are not finite are skipped.
 std::vector<CurvePoint> ThinCurve(std::span<const float> values, size_t most);
 
 } // namespace gw

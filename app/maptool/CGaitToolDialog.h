@@ -48,7 +48,7 @@ class CGaitToolDialog
 public:
     static constexpr int kClockMilliseconds = 17;
 
-    /// Both ports must outlive the tool.
+    /// Both arguments must outlive the tool.
     CGaitToolDialog(CToolWindow& window, const CPlatform& platform);
     ~CGaitToolDialog();
     CGaitToolDialog(const CGaitToolDialog&) = delete;
@@ -79,7 +79,7 @@ public:
     bool SaveMap(const std::string& path);
     /// Moves the result like the source, according to the lines. Missing bones have no effect.
     void Convert();
-    /// Writes the result, or before a conversion the target's own motion.
+    /// Writes the result, or the target's own motion if nothing has been converted yet.
     bool SaveResult(const std::string& path);
 
     // State for a window to show.

@@ -1,3 +1,5 @@
+// The list of map lines. Lines keep their text; only lines that the tool edits are rewritten.
+
 #include "CMapLineList.h"
 
 #include "ProfileNames.h"

@@ -1,3 +1,5 @@
+// The sentences of the map tool's status line.
+
 #include "ToolStatus.h"
 
 #include "CMotionFile.h"

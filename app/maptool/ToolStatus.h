@@ -13,16 +13,16 @@ class CMotionFile;
 
 /// A motion was loaded; includes only the first warning.
 std::string LoadedWords(const std::string& path, const CMotionFile& motion, const CFailureRecord& record);
-/// A file could not be read.
+/// Text for a file that could not be read.
 std::string FailedWords(const std::string& path, const CFailure& failure);
-/// The result could not be saved.
+/// Text for a result that could not be saved.
 std::string NotSavedWords(const std::string& path, const CFailure& failure);
 std::string ConvertedWords(const CMotionFile& result, const CFailureRecord& record);
-/// A file was written.
+/// Text for a file that was written.
 std::string SavedWords(const std::string& path);
 /// A map was loaded; includes the number of lines and of mappings left out.
 std::string MapWords(const std::string& path, size_t lineCount, size_t leftOut);
-/// A map could not be read.
+/// Text for a map that could not be read.
 std::string NoMapWords(const std::string& path);
 /// Appended after a motion was loaded and removed lines of the map; empty if it removed none.
 std::string PrunedWords(size_t lineCount);

@@ -21,7 +21,7 @@ constexpr std::string_view kMaker = "Tessarine";
 constexpr std::string_view kProgramFile = "Tessarine/Gaitwright.conf";
 constexpr std::string_view kMakerFile = "Tessarine.conf"; // shared by all programs of the maker
 constexpr std::string_view kSection = "Settings";
-constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // of an installation
+constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // in installations
 
 std::string Environment(const char* name)
 {
@@ -93,7 +93,7 @@ bool SplitKeyPath(const std::string& keyPath, std::string& product, std::string&
         return false;
     const size_t before = keyPath.rfind('\\', last - 1);
     version = keyPath.substr(last + 1);
-    product = keyPath.substr(before + 1, last - before - 1); // npos + 1 is 0
+    product = keyPath.substr(before + 1, last - before - 1); // works for npos, because npos + 1 is 0
     return !product.empty();
 }
 

@@ -11,7 +11,7 @@ namespace gw {
 enum class EPlatformWriting
 {
     No,  ///< settings are not stored and folders not created
-    Yes, ///< as a desktop program does
+    Yes, ///< as in a desktop program
 };
 
 /// The platform for systems with freedesktop folders, using plain files and no toolkit: settings in

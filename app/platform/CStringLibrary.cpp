@@ -1,3 +1,5 @@
+// Finds a string in the resources of a Windows library.
+
 #include "CStringLibrary.h"
 
 #include "CPlatform.h"
@@ -55,7 +57,7 @@ private:
 
 struct Headers
 {
-    uint64_t m_uiSections = 0; // offset of the section table
+    uint64_t m_uiSections = 0; // file offset of the section table
     uint32_t m_uiSectionCount = 0;
     uint32_t m_uiResources = 0; // relative address, as if loaded in memory
 };

@@ -6,7 +6,7 @@
 
 namespace gw {
 
-/// One choice of a file dialog's filter.
+/// One entry of a file dialog's filter.
 struct FileFilter
 {
     std::string text;                  ///< as shown to the user

@@ -26,7 +26,7 @@ std::string_view Trimmed(std::string_view text)
 // A logical line of the dialect, which quotes and backslashes continue past line ends.
 struct Line
 {
-    size_t m_uiBegin = 0; // in the whole text
+    size_t m_uiBegin = 0; // offset in the whole text
     size_t m_uiEnd = 0;   // after the last character, without the line end
     size_t m_uiEquals = std::string_view::npos;
     std::string_view m_kClosing; // missing closing characters if the text ends inside it
@@ -62,7 +62,7 @@ bool NextLineOf(std::string_view text, size_t from, Line& line)
             line.m_uiEquals = i;
     }
     line.m_uiEnd = std::min(i, text.size());
-    const bool isEscape = i > text.size(); // a backslash was the last character
+    const bool isEscape = i > text.size(); // the last character was a backslash
     line.m_kClosing = isEscape ? (quoted ? "\n\"" : "\n") : (quoted ? "\"" : "");
     return true;
 }

@@ -9,7 +9,7 @@ namespace gw {
 /// The program's messages, and other texts looked up by id.
 enum EMessage : int
 {
-    kOwnMessage = 0, ///< a text without an id
+    kOwnMessage = 0, ///< a text that has no id
     kAboutToolMessage = 101,
     kTitleMessage = 128,
     kListFontMessage = 129,     ///< font family of the profile list

@@ -8,7 +8,7 @@ namespace gw {
 /// A window's position as stored in the settings, in screen pixels.
 struct WindowPlacement
 {
-    int flags = 0; ///< written as 0
+    int flags = 0; ///< always written as 0
     int showCommand = 1;
     int minimisedX = 0;
     int minimisedY = 0;

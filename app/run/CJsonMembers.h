@@ -29,7 +29,7 @@ public:
         Null,
         Bool,
         Integer, ///< from -2^63 to 2^63 - 1
-        Number,  ///< any other
+        Number,  ///< any other number
         Text,
         Nested, ///< an object or array as compact JSON in `text`
     };

@@ -1,3 +1,6 @@
+// A progress line on a terminal. The rate is measured over the last seconds, so that the estimate follows a
+// changing speed.
+
 #include "CProgressBar.h"
 
 #include <algorithm>

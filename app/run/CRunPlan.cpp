@@ -1,3 +1,6 @@
+// Plans divide a run into shards of about equal work, estimated from file sizes: largest first, each to the
+// shard with the least work so far.
+
 #include "CRunPlan.h"
 
 #include "CJsonMembers.h"

@@ -56,7 +56,7 @@ private:
     Workers m_kWorkers;
     std::map<size_t, JobEnd> m_kEnded;        ///< waiting for an earlier one
     size_t m_uiNext = 0;                      ///< next job to give out
-    size_t m_uiTaken = 0;                     ///< number of jobs whose ends were taken, from the first
+    size_t m_uiTaken = 0;                     ///< number of jobs whose ends have been delivered
     bool m_bRefused = false;                  ///< the handler ended the run
     std::optional<Clock::time_point> ending_; ///< when the run began to end
 };

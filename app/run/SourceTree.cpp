@@ -1,3 +1,6 @@
+// Walks a folder tree in a fixed order. Links are followed only if they lead out of the walked tree, and each
+// folder is visited once, whatever its name, so cycles of links end.
+
 #include "SourceTree.h"
 
 #include "Paths.h"

@@ -1,4 +1,4 @@
-// From a source and the tables that a profile has filled to the target's motion.
+// Converts a source to the target's motion, with the tables filled from a profile.
 
 #include "CConversion.h"
 
@@ -27,8 +27,8 @@ namespace gw {
 
 namespace {
 
-// Rows divided by their lengths and multiplied by them again, as results have always been made; a row of
-// length 0 is left alone.
+// Divides rows by their lengths and multiplies them again, because results have always been computed that
+// way. A row of length 0 is not changed.
 void RebuildRows(Mat4& matrix)
 {
     const Vec3 lengths = RowLengths(matrix);
@@ -42,8 +42,8 @@ void RebuildRows(Mat4& matrix)
     }
 }
 
-// An aligned copy takes as many keys as the source's tracks hold; a container can name any end time without
-// a byte behind it.
+// An aligned copy takes as many keys as the source's tracks hold, and a container can claim any end time
+// without containing a byte for it.
 constexpr size_t kAnyKeyCount = size_t{1} << 22;
 
 size_t KeysHeld(const std::vector<CNode*>& joints)
@@ -58,7 +58,7 @@ size_t KeysHeld(const std::vector<CNode*>& joints)
     return keys;
 }
 
-// The number of frames; 0, with the failure recorded, where they are more than the source can have.
+// Returns the number of frames, or 0 and a failure if the source cannot have that many.
 int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
 {
     const std::vector<CNode*> joints = NodesOf(root);
@@ -70,7 +70,7 @@ int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
     return 0;
 }
 
-// Whether an alignment mends what a reader warns of.
+// Returns whether an alignment corrects the problem that a reader warns about.
 bool IsAligned(EFailure reason)
 {
     return reason == EFailure::RestPose || reason == EFailure::DoubledOffsets;
@@ -92,7 +92,7 @@ void ReportRecord(const std::string& path, const CFailureRecord& record, const C
 
 bool CConversion::Prepare(bool doRowsFit, EAlignedJoints joints)
 {
-    const CFailure& shares = retargeter_.Record().Failure(); // all that can have failed up to here
+    const CFailure& shares = retargeter_.Record().Failure(); // the only possible failure so far
     if (shares)
     {
         ReportRecord(shares.name, retargeter_.Record(), input_.choices, report_);
@@ -142,7 +142,7 @@ void CConversion::Run(bool useLegs, const std::function<void(size_t, size_t)>& p
     NormalizeBasePose();
 }
 
-// Puts the rest pose's root where the motion's root begins; rotation and scale stay.
+// Moves the rest pose's root to the start of the motion's root; rotation and scale do not change.
 void CConversion::NormalizeBasePose()
 {
     CNode* const root = FindBone(target_.restRoot.Get(), kRootBone);
@@ -167,8 +167,8 @@ void CConversion::ReportMisfit()
     report_(MakeReport(input_.profilePath, misfit));
 }
 
-// Reports the rows that name bones which are not there; false when there is none. A profile that lies in its
-// file as it is tells the lines.
+// Reports the rows that name missing bones; returns false if there are none. Line numbers are included if the
+// profile is unchanged from its file.
 bool CConversion::ReportMissingBones()
 {
     CNode* const target = target_.motionRoot.Get();
@@ -183,8 +183,8 @@ bool CConversion::ReportMissingBones()
     return !fit.missing.empty();
 }
 
-// Rows that turn limbs at rest were made for another rest pose, or for none. Of a rest pose that is no
-// T-pose the file's reader has warned already.
+// Rows that rotate limbs at rest were made for a different rest pose. If the rest pose is not a T-pose, the
+// file's reader has already warned about it.
 void CConversion::ReportTurnedAtRest()
 {
     const auto isRestPose = [](const CFailure& warning) { return warning.reason == EFailure::RestPose; };

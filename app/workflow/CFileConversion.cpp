@@ -1,3 +1,5 @@
+// The steps of a conversion from file to file. Each step reports what went wrong before it returns false.
+
 #include "CFileConversion.h"
 
 #include "AlignMotion.h"

@@ -1,3 +1,6 @@
+// The states of the desktop program: nothing open, source open, converted, saved. This file has the
+// transitions between them; the other sources of the class have the commands by subject.
+
 #include "CGaitConvertContent.h"
 
 #include "AttachBoneMeshes.h"

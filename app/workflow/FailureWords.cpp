@@ -1,3 +1,5 @@
+// The table of failures and warnings: a code for programs, a sentence for people, and a remedy.
+
 #include "FailureWords.h"
 
 #include "Paths.h"

@@ -51,7 +51,7 @@ struct Moment
 
 int LastFrame(const PictureMotion& motion)
 {
-    constexpr float kMost = 1e6f; // far above any motion, and exact
+    constexpr float kMost = 1e6f; // longer than any motion, and exactly representable
     return motion.lastFrame > 0.0f ? static_cast<int>(std::min(motion.lastFrame, kMost)) : 0;
 }
 

@@ -1,3 +1,6 @@
+// Paths and folders. Errors of the file system count as "no" or "empty", because callers then report a
+// missing file.
+
 #include "Paths.h"
 
 #include "PrivateNames.h"

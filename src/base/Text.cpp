@@ -1,3 +1,5 @@
+// Text helpers for the readers: tokens, lines, ASCII case, UTF-8 for printing, and the most similar name.
+
 #include "Text.h"
 
 #include <algorithm>

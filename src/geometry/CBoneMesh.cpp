@@ -1,3 +1,5 @@
+// The two bone shapes. Their points, triangles and order are fixed, since containers store them.
+
 #include "CBoneMesh.h"
 
 #include <algorithm>

@@ -1,3 +1,6 @@
+// Closes a seam: each pair of points moves to its middle, and the normals of the pair become their normalized
+// sum. Indices come from files, so those out of range are skipped.
+
 #include "CConnectData.h"
 
 #include "CFieldArchive.h"

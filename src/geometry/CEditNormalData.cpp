@@ -1,3 +1,6 @@
+// Smooths normals across meshes. All sums are computed from the old normals before any is written, so the
+// result does not depend on the order of the meshes.
+
 #include "CEditNormalData.h"
 
 #include "CFieldArchive.h"

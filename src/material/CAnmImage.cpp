@@ -1,3 +1,6 @@
+// Films: frames in the container, or a link to an animated file whose frames are read when the scene is
+// loaded.
+
 #include "CAnmImage.h"
 
 #include "CFieldArchive.h"

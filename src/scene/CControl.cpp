@@ -1,3 +1,5 @@
+// Converts a caller's time to a key time: frequency and phase, rounding to whole frames, then the cycle type.
+
 #include "CControl.h"
 
 #include "CFieldArchive.h"

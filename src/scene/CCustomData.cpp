@@ -1,3 +1,6 @@
+// Custom data. Raw data shares its bytes between copies, and can refer to a mapped file instead of memory,
+// which is how large motions are packaged.
+
 #include "CCustomData.h"
 
 #include "CFieldArchive.h"

@@ -1,4 +1,4 @@
-// A target skeleton driven by an aligned motion, whatever the profile's rows say of rotations.
+// A target skeleton driven by an aligned motion, whatever rotations the profile's rows contain.
 
 #include "AimBones.h"
 #include "AlignMotion.h"
@@ -19,7 +19,7 @@
 namespace gw {
 namespace {
 
-// A target as the host has it: bones along their own Y.
+// A target like the host's: bones along their own Y.
 constexpr MadeBone kBones[] = {
     {"LowerTorso", "", {0, 923, 13}, 0},      {"Waist", "LowerTorso", {0, 95, 0}, 0},
     {"UpperTorso", "Waist", {0, 150, 0}, 0},  {"Neck", "UpperTorso", {0, 265, 0}, 0},
@@ -47,7 +47,8 @@ private:
     std::map<std::string, Mat3> m_kRest;
 };
 
-// All target bones by their namesakes, with rotations that would spoil a conversion.
+// Maps all target bones to the source bones with the same names, with rotations that would spoil a
+// conversion.
 void FillTable(CRetargeter& table, const CMadeBody& source, const CTarget& target)
 {
     table.SetScenes(source.Motion().root, &target.Root());
@@ -71,7 +72,8 @@ CMadeBody HangingArms(std::vector<std::string> without = {})
     return CMadeBody(telling);
 }
 
-// Converts, and holds every bone's turn from the target's rest against the joint's turn from a T-pose.
+// Converts, and compares every bone's rotation from the target's rest pose with the joint's rotation from a
+// T-pose.
 void ExpectBonesFollow(const CMadeBody& told, const CMadeBody& truth, const CTarget& target,
                        CRetargeter& table)
 {

@@ -1,4 +1,4 @@
-// One motion told from many rest poses, and told again from the one that suits the rules.
+// One motion expressed relative to many rest poses, and re-expressed relative to a T-pose.
 
 #include "AlignMotion.h"
 #include "BoneMeshQueries.h"
@@ -25,7 +25,7 @@ bool IsOneOf(const std::string& joint, std::initializer_list<const char*> parts)
     return std::ranges::any_of(parts, [&](const char* part) { return joint.substr(1) == part; });
 }
 
-// Arms lowered from the T-pose, hands with them.
+// Lowers the arms from the T-pose, with the hands.
 Turn ArmsDown(double degrees)
 {
     return [=](const std::string& joint) {
@@ -40,7 +40,7 @@ Turn Everywhere(const Mat3& turn)
     return [=](const std::string&) { return turn; };
 }
 
-// Each bone along X, turned about it by some angle of its own.
+// Each bone along X, rotated about it by its own angle.
 Mat3 AlongX(const std::string& joint)
 {
     const bool isLeg = IsOneOf(joint, {"Thigh", "Calf", "Foot", "Toe"});
@@ -51,7 +51,7 @@ Mat3 AlongX(const std::string& joint)
     return LeastSwing(bone, kVec3UnitX) * TurnAbout(kVec3UnitX, twist);
 }
 
-// Shins and thighs lean by a degree or two, which is what turns their frames.
+// Shins and thighs lean by a degree or two, which is enough to rotate their frames.
 Mat3 Slanted(const std::string& joint)
 {
     if (IsOneOf(joint, {"Thigh", "Calf"}))
@@ -64,7 +64,7 @@ Mat3 TurnedKnees(const std::string& joint)
     return IsOneOf(joint, {"Thigh", "Calf"}) ? TurnAbout(kVec3UnitY, 70.0) : kMat3Identity;
 }
 
-// What a rest pose shows of hands and feet is not always how they are held and stand.
+// A rest pose does not always show how hands are held and feet stand.
 Mat3 RolledHand(const std::string& joint)
 {
     return joint == "LHand" ? TurnAbout(kVec3UnitX, 55.0) : kMat3Identity;
@@ -80,10 +80,10 @@ struct TellingRow
     const char* what;
     Turn turn;
     Mat3 world;
-    double degrees; ///< by which frames may stray from those that the motion was made with
+    double degrees; ///< by how much frames may differ from those that the motion was made with
 };
 
-// What a pose of the motion tells is not to the degree; a rest pose is.
+// A pose of the motion is not accurate to a degree; a rest pose is.
 std::vector<TellingRow> Tellings()
 {
     const Mat3 none = kMat3Identity;
@@ -175,7 +175,7 @@ TEST(AlignMotion, FindsTheFramesThatTheMotionWasMadeWith)
         {
             const std::string& name = truth.Names()[i];
             if (IsOneOf(name, {"Thumb", "Index", "Middle", "Little"}))
-                continue; // fingers go along with their hand's zero pose
+                continue; // fingers follow their hand's zero pose
             EXPECT_LT(DegreesBetween(NormalizedRows(found[i]), NormalizedRows(made[i])), row.degrees) << name;
         }
     }

@@ -35,7 +35,7 @@ constexpr MadeBone kJoints[] = {
 constexpr Vec3 kHandEnd{-9, 0, 0};
 constexpr double kLeg = 78.0;
 
-// A joint's rotation in the squat at a frame. Feet keep level while hips go down and arms go up.
+// Returns a joint's rotation in the squat at a frame. Feet stay level while the hips go down and the arms up.
 Mat3 Pose(const std::string& joint, int frame)
 {
     const double phase = std::sin(0.16 * frame);
@@ -100,7 +100,7 @@ CMadeBody::CMadeBody(const Telling& telling) : m_iFrames(telling.frameCount)
     m_kFigure.Root().UpdateScene(0.0f, true);
 }
 
-// As the reader of BVH files makes it.
+// As the reader of BVH files creates it.
 void CMadeBody::AddMesh(const std::string& name, const Telling& telling)
 {
     CNode& node = Joint(name);

@@ -9,20 +9,21 @@
 
 namespace gw {
 
-/// A body that squats, turns and lifts its arms, in centimetres, told from a rest pose that suits the rules;
-/// and the same motion told from any other one. Its joints bear the target's names.
+/// A body that squats, turns and lifts its arms, in centimeters, expressed relative to a T-pose; and the same
+/// motion relative to any other rest pose. Its joints have the target's names.
 class CMadeBody
 {
 public:
-    /// How the motion is told.
+    /// How the motion is expressed.
     struct Telling
     {
-        /// The turn A of a joint: seen from it, offsets o are o · A and world rotations inverse(A) · W.
+        /// Returns the rotation A of a joint: relative to it, offsets o are o · A and world rotations
+        /// inverse(A) · W.
         std::function<Mat3(const std::string& joint)> turn = [](const std::string&) { return kMat3Identity; };
-        Mat3 world = kMat3Identity; ///< turns the whole motion
+        Mat3 world = kMat3Identity; ///< rotates the whole motion
         bool doubled = false;       ///< positions repeat the offsets
         int frameCount = 40;
-        std::vector<std::string> without; ///< joints that are missing, with all below
+        std::vector<std::string> without; ///< missing joints, with their subtrees
     };
 
     explicit CMadeBody(const Telling& telling);
@@ -40,7 +41,7 @@ private:
     int m_iFrames;
 };
 
-/// The world matrices of all nodes of a tree at a frame, depth first.
+/// Returns the world matrices of all nodes of a tree at a frame, depth first.
 std::vector<Mat4> WorldsAt(CNode& root, float frequency, int frame);
 
 } // namespace gw

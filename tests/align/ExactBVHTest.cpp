@@ -1,4 +1,4 @@
-// What is written exactly reads as it was.
+// A motion that is written exactly reads back unchanged.
 
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
@@ -15,7 +15,7 @@
 namespace gw {
 namespace {
 
-// The motion written and read again.
+// Writes the motion and reads it again.
 void ExpectReadsAgain(CNode& root, float frequency, int frameCount, std::string& text)
 {
     const CTempFolder folder;

@@ -1,4 +1,4 @@
-// A source told from another rest pose for the length of a conversion.
+// A source re-expressed relative to another rest pose for one conversion.
 
 #include "CFileConversion.h"
 #include "ContentFixture.h"
@@ -13,7 +13,7 @@ std::string Replaced(std::string text, const std::string& what, const std::strin
     return place == std::string::npos ? text : text.replace(place, what.size(), with);
 }
 
-// The walker with a neck above its hip.
+// The walker, with a neck above its hip.
 std::string NeckedBvh()
 {
     const std::string neck = "JOINT neck\n{\nOFFSET 0 50 0\nCHANNELS 3 Zrotation Xrotation Yrotation\nEnd "
@@ -37,7 +37,7 @@ std::string NeckedTarget(const std::string& base)
     return Replaced(text, "[LPelvis]", "[Neck]\n1 0 0 0 0 0 0 1\n[LPelvis]");
 }
 
-// A profile whose rotations fit no rest pose at all.
+// A profile whose rotations fit no rest pose.
 std::string SpoiledMap()
 {
     const std::string text = BoneMapText("Poser", kPoserBones) + "neck <---> Neck 0,0,0,1,2,3\n";

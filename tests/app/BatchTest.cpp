@@ -18,8 +18,8 @@ std::string Joined(const std::set<std::string>& words)
 class BatchTest : public ContentTest
 {
 protected:
-    // Files are good sources, but for those with a mark behind their name: "!" is broken, "?" has other
-    // bones, "/" is a folder.
+    // Files are valid sources, except those with a mark after their name: "!" is broken, "?" has other bones,
+    // "/" is a folder.
     void WriteFiles(const std::string& folder, const char* files) const
     {
         for (const std::string& file : Words(files))
@@ -64,9 +64,9 @@ TEST_F(BatchTest, Runs)
         const char* files;
         const char* profile; // selected before the run
         const char* words;
-        const char* count;   // what the summary begins with
+        const char* count;   // start of the summary
         const char* results; // in the folder afterwards
-        const char* title;   // at the end, behind the product's name
+        const char* title;   // at the end, after the product's name
         int job;
         int answer;
     } rows[] = {

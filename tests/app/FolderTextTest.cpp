@@ -1,4 +1,4 @@
-// What is written into file dialogs: the text of the folder chooser, and filters.
+// Text entered in file dialogs: the path of the folder chooser, and filters.
 
 #include "FolderText.h"
 #include "FileFilter.h"

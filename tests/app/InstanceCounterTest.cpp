@@ -1,4 +1,4 @@
-// The word that tells how many instances run.
+// The shared word that counts the running instances.
 
 #include "CInstanceCounter.h"
 
@@ -16,7 +16,7 @@
 namespace gw {
 namespace {
 
-// A name that no other run has, and nothing left of it afterwards.
+// Uses a name of its own, and removes it afterwards.
 class InstanceCounter : public testing::Test
 {
 protected:

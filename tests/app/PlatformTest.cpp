@@ -17,7 +17,7 @@ namespace gw {
 
 TEST(IniText, Values)
 {
-    // held: of Settings/Window Pos; null when there is none
+    // held: value of Settings/Window Pos; null if missing
     const std::tuple<const char*, const char*, const char*> rows[] = {
         {"plain", "[Settings]\nWindow%20Pos=a b\n", "a b"},
         {"no file", "", nullptr},

@@ -29,7 +29,7 @@ TEST_F(ContentTest, TheListHoldsStockProfilesThenCustomOnes)
 
 TEST_F(ContentTest, PathsByDisplayName)
 {
-    Write("docs/BVH Profile/Custom1.prf", "poser\n"); // hidden by the stock profile of that name
+    Write("docs/BVH Profile/Custom1.prf", "poser\n"); // hidden by the stock profile with that name
     const std::tuple<const char*, const char*, std::string> rows[] = {
         {"a stock profile", "Poser", "data/PoserBVH.prf"},
         {"case does not matter", "POSER", "data/PoserBVH.prf"},
@@ -55,7 +55,7 @@ TEST_F(ContentTest, StockChoice)
     {
         const char* what;
         std::string source;
-        const char* before; // selected by hand before
+        const char* before; // selected by the user before
         const char* after;
     } rows[] = {
         {"the Poser profile fits", BvhText(kPoserBones), "", "Poser"},
@@ -114,7 +114,7 @@ TEST_F(ContentTest, DeletingAProfile)
 
 TEST_F(ContentTest, ADeletedNameThatWasListedOnceIsFreeAgain)
 {
-    m_kWindow.m_kList.SetCurSel(2); // choosing it would list it a second time
+    m_kWindow.m_kList.SetCurSel(2); // selecting it would list it a second time
     m_kContent.ChildClick("del");
     m_kContent.ProfileEditor()->EditField(kNameField, "Mine");
     m_kContent.ProfileEditor()->LeaveField();

@@ -10,10 +10,10 @@ struct ResourceString
 {
     uint32_t id;
     uint32_t language;
-    std::string text; ///< UTF-8 of at most three bytes a character
+    std::string text; ///< UTF-8, at most three bytes per character
 };
 
-/// The bytes of a 64-bit library that holds nothing but a string table.
+/// Returns the bytes of a 64-bit library that contains only a string table.
 std::string ResourceFile(const std::vector<ResourceString>& strings);
 
 } // namespace gw

@@ -1,4 +1,4 @@
-// What lies on the disk after a save, and what the user is told.
+// Files on disk after a save, and messages to the user.
 
 #include "ContentFixture.h"
 
@@ -13,7 +13,7 @@
 namespace gw {
 namespace {
 
-// The data block of a name in a package.
+// Returns the data block with a name in a package.
 std::span<const std::byte> DataOf(COrrinStream& package, const char* name)
 {
     CObject* const found = package.GetRoot(1)->FindObject(name, nullptr, false);
@@ -84,7 +84,7 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
     OpenAndConvert();
     const std::string path = Write("old.Kinetra", "old");
     chmod(path.c_str(), 0444);
-    // next: step, which ends what the title says
+    // next: a step that clears the title's report
     const std::tuple<const char*, const char*, const char*> rows[] = {
         {"a read-only package", "old.Kinetra", "click convert"},
         {"a folder that is not there", "none/out.Kinetra", "open gone.bvh"},

@@ -1,4 +1,4 @@
-// Texts: the program's own, a library's, and words for failures.
+// Texts: the program's own, a library's, and messages for failures.
 
 #include "ResourceFile.h"
 #include "TempFolder.h"
@@ -42,7 +42,7 @@ bool Find(const std::string& file, uint32_t id, uint32_t locale, std::string& te
 TEST(StringLibrary, StringsByIdAndLanguage)
 {
     const std::string file = Library();
-    // words: empty when none is found
+    // words: empty if none is found
     const std::tuple<const char*, uint32_t, uint32_t, const char*> rows[] = {
         {"the locale's own", 138, kGerman, "Ungültige Datei. \xe2\x82\xac"},
         {"another of the same language", 138, kAustrian, "Ungültige Datei. \xe2\x82\xac"},
@@ -65,7 +65,7 @@ TEST(StringLibrary, EveryPrefixIsRefusedOrGivesTheText)
     for (size_t size = 0; size < whole.size(); ++size)
     {
         const std::vector<char> cut(whole.begin(),
-                                    whole.begin() + static_cast<ptrdiff_t>(size)); // a block of its own
+                                    whole.begin() + static_cast<ptrdiff_t>(size)); // its own buffer
         std::string text;
         const bool found = FindResourceString(std::as_bytes(std::span(cut)), 138, kGerman, text);
         EXPECT_EQ(text, found ? "Ungültige Datei. \xe2\x82\xac" : "") << size;

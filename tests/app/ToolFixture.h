@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// A window that answers from a script.
+/// A window with scripted answers.
 class CScriptedToolWindow : public CToolWindow
 {
 public:
@@ -32,7 +32,7 @@ public:
 
     std::optional<std::string> answer;
     FileDialogSetup m_kAsked;
-    std::function<void(MapLine&)> onEdit; ///< what the user changes before OK; cancels without
+    std::function<void(MapLine&)> onEdit; ///< the user's changes before OK; not set: cancels
     MapLine m_kEdited;
     bool m_bClosed = false;
 
@@ -58,7 +58,7 @@ protected:
         m_kToolWindow.answer = file.empty() ? std::nullopt : std::optional(m_kFolder.Path(file));
         m_kTool.ClickButton(id);
     }
-    /// Loads a walk of some frames.
+    /// Loads a walk of `frameCount` frames.
     void LoadSource(int frameCount = 3)
     {
         Write("walk.bvh", BvhText(kPoserBones, frameCount));
@@ -84,7 +84,7 @@ protected:
         m_kTool.SelectTargetItem(m_kTool.TargetTree().Find(target));
         Click(kToolAddToMap);
     }
-    /// The bones that carry a marker: "hip lThigh > LowerTorso".
+    /// Returns the marked bones: "hip lThigh > LowerTorso".
     std::string Marked() const
     {
         return MarkedOf(m_kTool.SourceTree()) + '>' + MarkedOf(m_kTool.TargetTree());
@@ -106,7 +106,7 @@ protected:
         CNode* const root = m_kTool.Motion(motion).motionRoot.Get();
         return root ? static_cast<CNode*>(root->FindObject(name, &CNode::ms_kRTTI, true)) : nullptr;
     }
-    /// Where a bone of the result stands in a frame.
+    /// Returns the world matrix of a result bone at a frame.
     Mat4 ResultAt(const char* name, int frame)
     {
         m_kToolWindow.View(EToolMotion::Result).SeekStart();
@@ -115,7 +115,7 @@ protected:
         return Bone(EToolMotion::Result, name)->m_kWorldMatrix;
     }
 
-    /// Where all bones of the result stand, frame by frame.
+    /// Returns the world matrices of all result bones, frame by frame.
     std::vector<Mat4> ResultPoses()
     {
         std::vector<Mat4> poses;

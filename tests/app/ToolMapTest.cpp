@@ -1,4 +1,4 @@
-// The lines of the map tool: editing, loading and saving them, and what they do to a conversion.
+// The lines of the map tool: editing, loading and saving them, and their effect on a conversion.
 
 #include "ToolFixture.h"
 
@@ -206,7 +206,7 @@ TEST_F(ToolTest, BonesThatAreNotThereHaveNoEffect)
     EXPECT_EQ(ResultPoses(), plain);
 }
 
-// What a conversion leaves on the result must not show in the next one.
+// The changes that a conversion makes to the result must not affect the next one.
 
 TEST_F(ToolTest, HostileMaps)
 {

@@ -112,7 +112,7 @@ TEST_F(ToolTest, AConversionAddsThePositionToWhereTheSkeletonStands)
     EXPECT_GT(Vec3Length(origin), 1.0);
 }
 
-// The page on map lines holds a map, and a table of what changes of its text do to a conversion.
+// The page on map lines contains a map, and a table of the effects of changes on a conversion.
 
 TEST_F(ToolTest, AConversionDoesNotDependOnTheOneBefore)
 {
@@ -211,6 +211,6 @@ TEST_F(ToolTest, AMissingFixedSkeletonIsSaid)
     EXPECT_TRUE(m_kTool.IsEnabled(kToolLoadMap));
 }
 
-// Whatever a file holds, it is lines, and a conversion runs through them.
+// Any file can be read as lines and used in a conversion.
 
 } // namespace gw

@@ -1,4 +1,4 @@
-// Opening, converting, discarding: the four states and what leads from one to the next.
+// Opening, converting, discarding: the four states and their transitions.
 
 #include "ContentFixture.h"
 
@@ -212,7 +212,7 @@ TEST_F(ContentTest, EveryConversionStartsFromTheTargetAsItIsOnTheDisk)
     std::string text = ReadBytes(base);
     const size_t offset = text.find("RThigh -95") + 8;
     Write("walk.bvh", BvhText(kPoserBones));
-    for (const bool isReplaced : {false, true}) // by another file of the same size and time, else in place
+    for (const bool isReplaced : {false, true}) // by a new file of equal size and time, or in place
     {
         SCOPED_TRACE(isReplaced);
         const std::filesystem::file_time_type before{std::chrono::hours(1)};

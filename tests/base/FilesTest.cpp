@@ -46,7 +46,7 @@ size_t EntryCount(const CTempFolder& folder)
         std::distance(fs::directory_iterator(folder.Path()), fs::directory_iterator()));
 }
 
-// A file system that takes no more than so many bytes a file.
+// Limits the size of files, like a full disk.
 class CFullDisk
 {
 public:
@@ -120,7 +120,7 @@ TEST(Paths, WhatIsThereIsToldApart)
         EXPECT_EQ(size, hasSize ? 5u : 99u);
         EXPECT_FALSE(IsReadOnly(path));
     }
-    // Also for root, who may write it all the same.
+    // Also for root, who could write it anyway.
     fs::permissions(file, fs::perms::owner_read | fs::perms::group_read);
     EXPECT_TRUE(IsReadOnly(file));
     EXPECT_FALSE(DeleteFile(folder.Path()));
@@ -175,7 +175,7 @@ TEST(CMappedFile, MapsRegularFilesOnly)
     {
         SCOPED_TRACE(what);
         CMappedFile file;
-        ASSERT_EQ(file.Open(folder.Path("full")), EFailure::None); // which is replaced in every case
+        ASSERT_EQ(file.Open(folder.Path("full")), EFailure::None); // replaced in every case
         EXPECT_EQ(file.Open(path), failure);
         EXPECT_EQ(file.Text(), text);
         EXPECT_EQ(file.Bytes().size(), file.Text().size());
@@ -207,7 +207,7 @@ TEST(CMappedFile, KeepsItsBytesWhenMovedAndAfterForgetting)
     }
 }
 
-// A mapping that loses its pages gives zeros and says so; it does not end the program.
+// A mapping that loses its pages yields zeros and reports it; the program continues.
 TEST(CMappedFile, AFileThatIsCutWhileItIsReadIsNotWhole)
 {
     constexpr size_t size = (size_t{1} << 21) + 1000;
@@ -254,14 +254,15 @@ TEST(CSafeFile, ReplacesInOneStepAndKeepsGroupAndPermissions)
     const CTempFolder folder;
     const std::string path = folder.Path("a.htr");
     WriteBytes(path, "old");
-    [[maybe_unused]] const int foreign = chown(path.c_str(), static_cast<uid_t>(-1), 4321); // as root only
+    // only works for root
+    [[maybe_unused]] const int foreign = chown(path.c_str(), static_cast<uid_t>(-1), 4321);
     const gid_t group = StatusOf(path).st_gid;
-    fs::permissions(path, fs::perms(06660)); // which the user's mask would cut
+    fs::permissions(path, fs::perms(06660)); // the umask would remove these
     CSafeFile file;
     const mode_t mask = umask(022);
     ASSERT_TRUE(file.Open(path));
     umask(mask);
-    EXPECT_EQ(ModeOf(file.PrivatePath()), 0600u); // not laid open meanwhile
+    EXPECT_EQ(ModeOf(file.PrivatePath()), 0600u); // not readable by others in the meantime
     EXPECT_TRUE(file.Write("new "));
     const std::byte bytes[] = {std::byte{'0'}, std::byte{0}};
     EXPECT_TRUE(file.Write(bytes));
@@ -297,7 +298,7 @@ TEST(CSafeFile, WithoutACommitOrOnAFullDiskTheOldFileStays)
         CSafeFile file;
         ASSERT_TRUE(file.Open(path));
         EXPECT_TRUE(file.Write("new"));
-        ASSERT_TRUE(file.Open(path)); // begins anew
+        ASSERT_TRUE(file.Open(path)); // starts again
         EXPECT_TRUE(file.Write("newer"));
     }
     EXPECT_EQ(ReadBytes(path), "old");
@@ -387,7 +388,7 @@ TEST(CSafeFile, PrivateFilesLieBesideAndDiffer)
     EXPECT_EQ(EntryCount(folder), 0u);
 }
 
-// Also if the name says that its program lives, or ran elsewhere: only the lock counts.
+// Even if the name says that its program is running, or ran elsewhere: only the lock counts.
 TEST(PrivateNames, ASaveRemovesWhatNoLivingProgramHolds)
 {
     const CTempFolder folder;
@@ -416,7 +417,7 @@ TEST(PrivateNames, ASaveRemovesWhatNoLivingProgramHolds)
     EXPECT_FALSE(FileExists(left));
 }
 
-// Programs that create, sweep and rename in one folder at once, as shards do.
+// Programs that create, sweep and rename in one folder at the same time, as shards do.
 TEST(PrivateNames, SweepersTakeNothingFromThoseWhoWrite)
 {
     const CTempFolder folder;

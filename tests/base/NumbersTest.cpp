@@ -20,14 +20,14 @@ constexpr float kInfinity = std::numeric_limits<float>::infinity();
 constexpr float kNan = std::numeric_limits<float>::quiet_NaN();
 constexpr float kUntouched = -99.0f;
 
-// Sign and bits; all numbers that are none are one.
+// Compares sign and bits; all NaNs are equal.
 template <class T>
 bool IsSame(T a, T b)
 {
     return std::signbit(a) == std::signbit(b) && (a == b || (std::isnan(a) && std::isnan(b)));
 }
 
-// The text in a block of its own: one byte read too many is seen by the sanitizer.
+// The text in its own buffer: the sanitizer notices one byte read too many.
 struct CBlock
 {
     explicit CBlock(std::string_view text) : bytes(text.begin(), text.end()) {}
@@ -72,7 +72,7 @@ std::string Printed(float value, int decimals = 6)
     return text;
 }
 
-// Letters of numbers in a random order, now and then a number of some printed form.
+// Characters of numbers in random order, and sometimes a number in a printed form.
 std::string RandomText(std::mt19937_64& random)
 {
     constexpr std::string_view kLetters = "0123456789012345678901234567890.....--++eExXpPinfatyN(ab) \t,";
@@ -99,7 +99,7 @@ std::string RandomText(std::mt19937_64& random)
 
 } // namespace
 
-// What random texts do not reach, and the verdicts, which the library does not give.
+// Cases that random texts do not reach, and the kinds, which the library does not report.
 TEST(Numbers, OddTextsHaveTheirValueAndTheirKind)
 {
     const std::string digits = "1" + std::string(400, '0') + "e-400";
@@ -110,7 +110,7 @@ TEST(Numbers, OddTextsHaveTheirValueAndTheirKind)
         std::string text;
         float value;
         ENumber kind;
-        bool scanned; // sscanf leaves alone some texts that strtod begins to read
+        bool scanned; // sscanf rejects some texts of which strtod reads the beginning
     } rows[] = {
         {"plain", "-12.345678", -12.345678f, ENumber::Whole, true},
         {"negative zero", "-0.000000", -0.0f, ENumber::Whole, true},
@@ -229,7 +229,7 @@ TEST(Numbers, FloatsPrintAsTheLibraryPrintsThem)
     for (int i = 0; i < 1000000; ++i)
     {
         auto bits = static_cast<uint32_t>(random());
-        if (i % 2) // exponents at which digits stand on both sides of the point
+        if (i % 2) // exponents with digits on both sides of the point
             bits = (bits & 0x807fffff) | static_cast<uint32_t>(100 + random() % 70) << 23;
         if (i % 8 == 0) // few bits: exactly between two decimals
             bits &= ~0u << random() % 23;

@@ -9,7 +9,7 @@
 namespace gw {
 namespace {
 
-// All tokens, or all lines, each with a bar behind it.
+// Returns all tokens, or all lines, each followed by a bar.
 std::string Tokens(std::string_view text)
 {
     std::string tokens;

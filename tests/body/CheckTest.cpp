@@ -90,7 +90,7 @@ TEST(CheckBody, DoubtsMapsThatAreWrong)
 
 TEST(CheckBody, LegsGoAwayFromTheHead)
 {
-    // Hip, spine and head in the wrong order along a chain: what hangs at the hip goes up with the trunk.
+    // Hip, spine and head in the wrong order along a chain: the branches at the hip go up with the trunk.
     Ref<CNode> hip = new CNode;
     const auto hang = [](CNode* parent, const Vec3& offset) {
         auto* const node = new CNode;
@@ -127,7 +127,7 @@ TEST(CheckBody, AskedOfNothingDoubtsNothing)
     EXPECT_TRUE(CheckBody(body).empty());
 }
 
-// Gives the joints of a made body names of the usual kind.
+// Gives the joints of a made body ordinary names.
 void NameBody(const CBodyMap& body, const char* left, const char* right)
 {
     body.hip->SetName("Hips");
@@ -191,7 +191,7 @@ TEST(FindBody, NamesAndShapeTogether)
     EXPECT_TRUE(found.doubts.empty());
     EXPECT_TRUE(found.sidesAreSure);
     EXPECT_EQ(found.Evidence({EBodyJoint::Thigh, Left}), EBodyEvidence::Both);
-    // The toe has no name that says anything, and its foot is the same by name and shape.
+    // The toe's name says nothing; its foot is the same by name and by shape.
     EXPECT_EQ(found.Evidence({EBodyJoint::Toe, Right}), EBodyEvidence::Shape);
     EXPECT_EQ(found.body.legs[1].toe, shaped.legs[1].toe);
 }
@@ -211,7 +211,7 @@ TEST(FindBody, NamesThatThePlacesContradictGiveWay)
 TEST(FindBody, SaysWhenNoPoseShowsTheSides)
 {
     EXPECT_TRUE(FindBody(CMadeSkeleton("", 1).Root()).sidesAreSure);
-    // Feet without toes or tips and straight knees look nowhere.
+    // Feet without toes or tips, and straight knees, show no direction.
     const FoundBody found = FindBody(CMadeSkeleton("notoes bare", 1).Root());
     EXPECT_TRUE(found.body.DrivesBody());
     EXPECT_FALSE(found.sidesAreSure);
@@ -227,7 +227,7 @@ TEST(FindBody, LeavesThePoseAsItWas)
     EXPECT_EQ(FindBodyByShape(root).head->m_kWorldMatrix, before);
 }
 
-// Trees that a careless or hostile file may hold.
+// Trees that a careless or hostile file can contain.
 TEST(FindBody, FindsNoneWhereNoneIs)
 {
     const struct
@@ -260,7 +260,7 @@ TEST(FindBody, FindsNoneWhereNoneIs)
     }
 }
 
-// The takes of many recorders: what their names say is what their shapes say.
+// Recordings from many sources: their names and shapes agree.
 TEST(FindBody, NamesAndShapesOfRealFilesAgree)
 {
     if (SharedDataFolder().empty())
@@ -270,10 +270,10 @@ TEST(FindBody, NamesAndShapesOfRealFilesAgree)
     {
         SCOPED_TRACE(name);
         CMotionFile motion;
-        if (!motion.Load(folder + name)) // one has an empty line where none may stand
+        if (!motion.Load(folder + name)) // one has a blank line that is not allowed
             continue;
         const CBodyMap named = FindBodyByNames(*motion.motionRoot);
-        if (!named.DrivesBody()) // two are no bodies
+        if (!named.DrivesBody()) // two are not bodies
             continue;
         EXPECT_TRUE(CheckBody(named).empty());
         const CBodyMap shaped = FindBodyByShape(*motion.motionRoot);

@@ -11,8 +11,8 @@
 namespace gw {
 namespace {
 
-// A body whose legs hang on helpers of a side's letter. The conventions of other makers are tested with the
-// profiles that are made for them.
+// A body whose legs are attached to helpers with a side letter. The naming conventions of other programs are
+// tested with their profiles.
 constexpr std::string_view kBody = "Hips(LHipJoint(LeftUpLeg(LeftLeg(LeftFoot(LeftToeBase)))) "
                                    "RHipJoint(RightUpLeg(RightLeg(RightFoot(RightToeBase)))) "
                                    "LowerBack(Spine(Spine1(LeftShoulder(LeftArm(LeftForeArm(LeftHand))) "
@@ -22,7 +22,7 @@ constexpr const char* kPlaces =
     "Hips Spine1 Neck Head LeftShoulder LeftArm LeftForeArm LeftHand RightShoulder RightArm RightForeArm "
     "RightHand "
     "LeftUpLeg LeftLeg LeftFoot LeftToeBase RightUpLeg RightLeg RightFoot RightToeBase ";
-// What else may hang on joints.
+// Other things that can be attached to joints.
 constexpr std::pair<const char*, const char*> kExtras[] = {
     {"LeftHand", "LeftHand_End LeftInHandIndex LeftHandThumb1 LeftHandMiddle1 Props_LeftArm"},
     {"RightHand", "RightHand_End RightInHandIndex RightHandThumb1 RightHandMiddle1 Props_RightArm"},
@@ -44,7 +44,7 @@ std::string NamesOf(const std::vector<CNode*>& nodes)
     return names;
 }
 
-// A tree as text: "Hips(Spine(Head) LeftLeg)".
+// Builds a tree from text: "Hips(Spine(Head) LeftLeg)".
 Ref<CNode> Tree(std::string_view text)
 {
     Ref<CNode> root;

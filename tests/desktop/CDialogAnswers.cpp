@@ -21,8 +21,8 @@ bool IsExposed(const QWidget& window)
     return window.isVisible() && window.windowHandle() && window.windowHandle()->isExposed();
 }
 
-// The toolkit's own wait takes a window for active while its owner is. The screen of the tests has no window
-// manager, and whoever has the keyboard when a window goes is left to chance: so it is asked for again.
+// The toolkit's own wait treats a window as active while its owner is. The test screen has no window manager,
+// so which window gets the keyboard when one closes is up to chance; request it again.
 bool HasKeyboard(QWidget& window)
 {
     const bool isActive = QApplication::activeWindow() == &window;
@@ -75,7 +75,7 @@ CDialogAnswers::~CDialogAnswers()
     EXPECT_EQ(m_kAnswers.size(), 0u) << "a window that was expected never came up";
 }
 
-// The next look is set first: what is done in this one may run the next window's loop before it returns.
+// Schedules the next look first, because this one may run the next window's event loop before it returns.
 void CDialogAnswers::Look()
 {
     QTimer::singleShot(kLookInterval, this, [this] { Look(); });
@@ -94,7 +94,7 @@ void CDialogAnswers::Look()
         Give(*dialog);
 }
 
-// Taken first, for the same reason.
+// Removed from the list first, for the same reason.
 void CDialogAnswers::Give(QWidget& dialog)
 {
     const Answer answer = std::move(m_kAnswers.front());
@@ -106,7 +106,7 @@ void CDialogAnswers::Give(QWidget& dialog)
     m_kAnswers.insert(m_kAnswers.begin(), answer);
 }
 
-// A test that went wrong once has had its patience.
+// A test that has failed once does not wait again.
 void CDialogAnswers::CloseLeft(QWidget& dialog)
 {
     ADD_FAILURE() << "a window is left open: " << ToUtf8(dialog.windowTitle());

@@ -11,28 +11,28 @@ class QMenu;
 
 namespace gw {
 
-/// Lets the program run until something holds; false after twenty seconds.
+/// Runs the program until a condition holds; returns false after twenty seconds.
 bool WaitUntil(const std::function<bool()>& holds);
-/// Gives a window the keyboard and lets the program run until the window has it. Without it keys are lost.
+/// Gives a window the keyboard and waits until it has it. Otherwise keys would be lost.
 void Activate(QWidget& window);
-/// Waits for the menu that was asked for; null, and the test fails, where none opens.
+/// Waits for the requested menu; if none opens, returns null and the test fails.
 QMenu* OpenMenu();
 /// Clicks an entry of that menu.
 void ClickInMenu(int row);
 
-/// What a person does with the modal windows that come up, within whatever loop of events. Each answer is for
-/// one window, in this order, and waits until the window stands there and has the keyboard. A window that
-/// nobody answers, or that its answer leaves open, fails the test and is closed, so that no test hangs.
+/// Answers modal windows like a user, in any event loop. Each answer is for one window, in order, and waits
+/// until the window is shown and has the keyboard. A window without an answer, or one that its answer does
+/// not close, fails the test and is closed, so that tests never hang.
 class CDialogAnswers : public QObject
 {
 public:
-    /// Ends a window; false, and nothing done, where it is not the one that the answer is for.
+    /// Closes a window; returns false, and does nothing, if the answer is for another window.
     using Answer = std::function<bool(QWidget& dialog)>;
 
     CDialogAnswers();
-    /// With an answer that suits any window.
+    /// Starts with an answer for any window.
     explicit CDialogAnswers(const std::function<void(QWidget& dialog)>& act);
-    /// A test fails whose windows did not all come up.
+    /// Fails the test if expected windows did not open.
     ~CDialogAnswers() override;
 
     void Add(Answer answer) { m_kAnswers.push_back(std::move(answer)); }
@@ -46,7 +46,7 @@ private:
     QPointer<QWidget> m_kSeen;
     QElapsedTimer m_kSinceSeen;
     int m_iPatience;
-    bool m_bAnswered = false; // the seen one
+    bool m_bAnswered = false; // the window that was seen last
 };
 
 } // namespace gw

@@ -55,7 +55,7 @@ CPerson::CPerson()
     Start();
 }
 
-// What was queued finds everything as it was.
+// Queued events run while everything still exists.
 CPerson::~CPerson()
 {
     Wait(0);

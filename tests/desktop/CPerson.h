@@ -17,7 +17,7 @@ class QWidget;
 
 namespace gw {
 
-/// A home folder of its own: whoever is made while it lives finds settings and documents there.
+/// A temporary home folder: objects created while it exists find settings and documents there.
 class CTempHome
 {
 public:
@@ -29,7 +29,7 @@ private:
     CTempFolder m_kFolder;
 };
 
-/// A person in front of the main window, who knows it by its children's names and works with mouse and keys.
+/// A user of the main window, who finds its children by name and works with mouse and keys.
 class CPerson
 {
 public:
@@ -40,38 +40,37 @@ public:
     CGaitConvertContent& Content() { return m_spFrame->Content(); }
     const CTempHome& Home() const { return m_kHome; }
 
-    /// A child of the main window, by name; a test that asks for one that is not there fails.
+    /// Returns a child of the main window by name; fails the test if it does not exist.
     QWidget* Child(const char* name);
     bool IsOn(const char* name);
     QString Title();
     QString Place();
-    /// What a view shows.
+    /// Returns the picture of a view.
     QImage Picture(const char* view);
 
     void Click(const char* name);
-    /// Clicks as a person does: the press takes its time and activates the main window, if another one was
-    /// active.
+    /// Clicks like a person: the press takes time and activates the main window if another one was active.
     void ClickSlowly(const char* name);
-    /// Presses a left key over a window of the program; with null, another program has the keyboard.
+    /// Presses a left key over a window of the program; with null, while another program has the keyboard.
     void PressLeft(EKey key, QWidget* window);
     void ReleaseLeft(EKey key, QWidget* window);
     void Type(int key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void Drop(const std::string& path);
     void ChooseProfile(const QString& name);
-    /// Closes the program and starts it anew, in the same home.
+    /// Closes the program and starts it again with the same home folder.
     void Restart();
 
-    // What a person does when the next window comes up, said before it does. Each window answers one.
-    /// A message box: clicks the button of a name ("ok", "yes").
+    // Actions for the next window, set before it opens. Each window uses one.
+    /// For a message box: clicks the button with a name ("ok", "yes").
     void WillAnswer(const char* button);
-    /// A file dialog: types a path and accepts; with an empty path cancels.
+    /// For a file dialog: types a path and accepts; cancels if the path is empty.
     void WillChooseFile(const std::string& path);
-    /// The folder chooser: types a folder, selects a filter from 1 on, accepts.
+    /// For the folder chooser: types a folder, selects a filter (starting at 1), accepts.
     void WillChooseFolder(const std::string& folder, int filter);
-    /// The texts of the message boxes that came up.
+    /// Texts of the message boxes so far.
     QStringList m_kBoxes;
     QString m_kDetails;       ///< of the last one
-    bool m_bUnfolded = false; ///< whether they could be seen at once
+    bool m_bUnfolded = false; ///< whether they were visible from the start
 
     void Wait(int milliseconds);
 
@@ -80,14 +79,14 @@ private:
 
     CTempHome m_kHome;
     std::unique_ptr<CFilePlatform> m_spPlatform;
-    std::set<EKey> m_kHeld; // on the keyboard, whoever has the focus
+    std::set<EKey> m_kHeld; // on the keyboard, whichever window has the focus
     CLeftKeys m_kKeys{[this] { return m_kHeld; }};
     CSkin m_kSkin;
     std::unique_ptr<CGaitConvertFrame> m_spFrame;
     CDialogAnswers m_kAnswers;
 };
 
-/// The path of an example motion of the project's own.
+/// Returns the path of one of the project's example motions.
 std::string ExampleFile(std::string_view name);
 
 } // namespace gw

@@ -1,5 +1,5 @@
-// What the desktop is asked to show. A script stands for the programs that open things, an object on the
-// session's bus for the file manager.
+// Requests to the desktop. A script takes the place of the programs that open things, an object on the
+// session bus that of the file manager.
 
 #include "DesktopServices.h"
 #include "CDialogAnswers.h"
@@ -29,7 +29,7 @@ public:
     QStringList m_kShown;
 };
 
-// The script stays for all tests: the toolkit looks once for what opens things.
+// All tests share the script, because the toolkit looks up the opening program only once.
 class DesktopServices : public testing::Test
 {
 protected:
@@ -50,7 +50,7 @@ protected:
 
     static std::string OpenedFile() { return qgetenv("HOME").toStdString() + "/opened"; }
 
-    // What was opened since the last call.
+    // Returns what was opened since the last call.
     static std::string Opened()
     {
         EXPECT_TRUE(WaitUntil([] { return FileExists(OpenedFile()); }));
@@ -92,7 +92,7 @@ TEST_F(DesktopServices, ShowTheFileInTheFileManager)
     EXPECT_TRUE(WaitUntil([&] { return !manager.m_kShown.isEmpty(); }));
     EXPECT_EQ(manager.m_kShown, QStringList(QStringLiteral("file:///takes/walk%20%231.htr")));
     QTest::qWait(50);
-    EXPECT_FALSE(FileExists(OpenedFile())); // not the folder as well
+    EXPECT_FALSE(FileExists(OpenedFile())); // the folder was not opened as well
     QDBusConnection::disconnectFromBus(name);
 }
 

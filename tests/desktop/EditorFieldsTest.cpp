@@ -1,4 +1,4 @@
-// A person renames a profile, sets its rate and a row's offset, saves, and comes and goes.
+// A user renames a profile, sets its rate and a row's offset, saves, and moves between fields.
 #include "EditorFixture.h"
 
 #include "CBoneOffsetWindow.h"
@@ -172,7 +172,7 @@ TEST_F(EditorFields, WhatChangesWhileTheWindowIsHiddenIsSeenLater)
 class EditorPlace : public EditorTest
 {
 protected:
-    /// The place that the settings hold once the window was opened and closed.
+    /// Returns the stored position after the window was opened and closed.
     WindowPlacement OpenAndClose()
     {
         OpenEditor();
@@ -200,7 +200,7 @@ TEST_F(EditorPlace, AWindowComesBackToWhereItWas)
     ASSERT_TRUE(ScanPlacement(m_kPlatform.ReadSetting("DialogPos"), placement));
     EXPECT_EQ(placement.left, 123);
     EXPECT_EQ(placement.top, 45);
-    m_kEditor.windowHandle()->setPosition(300, 300); // as a window manager does that places new windows
+    m_kEditor.windowHandle()->setPosition(300, 300); // like a window manager that positions new windows
     Toggle(true);
     EXPECT_EQ(m_kEditor.pos(), QPoint(123, 45));
     m_kEditor.move(200, 70);

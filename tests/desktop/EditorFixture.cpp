@@ -10,7 +10,7 @@ namespace gw {
 void Settle()
 {
     QApplication::processEvents();
-    QApplication::processEvents(); // what was queued meanwhile
+    QApplication::processEvents(); // handles events queued in the meantime
 }
 
 EditorTest::EditorTest()
@@ -20,7 +20,7 @@ EditorTest::EditorTest()
     m_kWindow.onBoneOffset = [this](CBoneOffsetDialog& dialog) { return m_kEditor.RunBoneOffset(dialog); };
 }
 
-// What was queued finds everything as it was.
+// Queued events run while everything still exists.
 EditorTest::~EditorTest()
 {
     Settle();

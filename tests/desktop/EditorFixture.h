@@ -16,30 +16,30 @@
 
 namespace gw {
 
-/// The editor's window beside a scripted main window: what a person does in it, and what stands in it then.
+/// The editor's window with a scripted main window: user actions, and the visible state.
 class EditorTest : public ContentTest
 {
 protected:
     EditorTest();
     ~EditorTest() override;
 
-    /// Opens a source that the stock profile "Poser" fits, and then the editor.
+    /// Opens a source that fits the stock profile "Poser", then the editor.
     void OpenEditor();
     /// Shows or hides the editor as the main window's toggle does.
     void Toggle(bool shown);
     CProfileEditorDialog& Model() const { return *m_kContent.ProfileEditor(); }
 
-    // What the person does
+    // User actions
     void Type(int field, const char* text);
     void Press(Qt::Key key, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void Click(int button);
     void ClickBone(int tree, const std::string& name);
     void ClickRow(int row, Qt::KeyboardModifiers modifiers = Qt::NoModifier);
     void DoubleClickRow(int row);
-    /// What the person will do in the offset dialog once it opens.
+    /// Sets the actions in the offset dialog, once it opens.
     void InOffsetDialog(const std::function<void(QWidget& dialog)>& actions);
 
-    // What the person sees
+    // Visible state
     template <class Widget>
     Widget& Child(const QString& name) const
     {
@@ -54,22 +54,22 @@ protected:
     }
     std::string Field(int field) const;
     bool IsEnabled(int button) const;
-    /// The names of a tree from the top on, unfolded bones only.
+    /// Returns the names of a tree from top to bottom, expanded bones only.
     std::vector<std::string> Bones(int tree) const;
     std::string SelectedBone(int tree) const;
-    /// The rows as "hip > LowerTorso 0 0 0"; axes stand behind where they are not neutral.
+    /// Returns the rows as "hip > LowerTorso 0 0 0", followed by the axes unless they are neutral.
     std::vector<std::string> Rows() const;
     std::vector<int> SelectedRows() const;
 
-    /// The message boxes since the last time, as "box 157".
+    /// Returns the message boxes since the last time, as "box 157".
     std::vector<std::string> TakeBoxes();
 
-    QWidget m_kOwner; ///< stands for the main window
+    QWidget m_kOwner; ///< in place of the main window
     CProfileEditorWindow m_kEditor{m_kContent, m_kPlatform, &m_kOwner};
     CDialogAnswers m_kAnswers;
 };
 
-/// Lets the window take up what was sent and queued.
+/// Lets the window handle everything that was sent and queued.
 void Settle();
 
 } // namespace gw

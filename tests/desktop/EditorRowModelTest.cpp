@@ -1,4 +1,4 @@
-// A list that only hears of changes shows what the table holds.
+// A list that only receives changes shows the same as the table.
 #include "CMapRowModel.h"
 
 #include <QAbstractItemModelTester>
@@ -8,7 +8,7 @@
 namespace gw {
 namespace {
 
-/// Holds a model's rows as a view would: by the changes alone.
+/// Keeps a copy of a model's rows like a view: by its change notifications only.
 class CMirror
 {
 public:

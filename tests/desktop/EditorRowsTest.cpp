@@ -1,4 +1,4 @@
-// A person maps bones: trees, list of rows and buttons of the editor's window.
+// A user maps bones: trees, rows and buttons of the editor's window.
 #include "EditorFixture.h"
 
 #include "BoneMarker.h"
@@ -23,7 +23,7 @@ class EditorRows : public EditorTest
 protected:
     EditorRows() { OpenEditor(); }
 
-    /// Loads a profile of these rows in place of the present one.
+    /// Loads a profile with these rows.
     void Use(const std::string& rows)
     {
         Click(kRemoveAllButton);

@@ -1,4 +1,4 @@
-// A second start brings the first window to the front, and nothing else that knocks does any harm.
+// A second start raises the first window, and other clients do no harm.
 
 #include "CDialogAnswers.h"
 #include "CInstanceServer.h"
@@ -21,7 +21,7 @@ namespace {
 
 using testing::ElementsAre;
 
-// The address of the program, in a runtime folder of the test's own.
+// The program's address, in a runtime folder of the test.
 class Instances : public testing::Test
 {
 protected:
@@ -36,17 +36,17 @@ protected:
         return [this](const std::string& path) { m_kRaised.push_back(path); };
     }
 
-    // A second start, which is another process: the first one goes on meanwhile.
+    // Starts a second process; the first one keeps running.
     bool StartAgain(const std::string& path = {})
     {
         auto answer = std::async(std::launch::async, [&] { return RaiseFirstInstance(path); });
         while (answer.wait_for(std::chrono::seconds(0)) != std::future_status::ready)
             QTest::qWait(1);
-        QTest::qWait(1); // what was asked for comes in the next round of events
+        QTest::qWait(1); // handles events queued by the request
         return answer.get();
     }
 
-    // A socket at the program's address that nobody serves.
+    // Creates a socket at the program's address without a server.
     int OwnAddress()
     {
         sockaddr_un address = {};
@@ -90,7 +90,7 @@ TEST_F(Instances, ALivingOwnerKeepsItsName)
 
 TEST_F(Instances, TheNameOfADeadOwnerIsTakenOver)
 {
-    close(OwnAddress()); // leaves its file
+    close(OwnAddress()); // the file remains
     ASSERT_TRUE(QFile::exists(InstanceSocketPath()));
     EXPECT_FALSE(StartAgain());
     const CInstanceServer server(Remember());
@@ -187,7 +187,7 @@ TEST_F(Instances, TheyMeetWhereNobodyElseCanWrite)
         qputenv("XDG_RUNTIME_DIR", runtimeFolder.c_str());
         EXPECT_EQ(InstanceSocketPath().toStdString(), meeting + "/TK_KESTRO_GAIT_CONV_1");
     }
-    folder("gaitwright-" + std::to_string(geteuid()), 0x7777); // as an enemy would have made it
+    folder("gaitwright-" + std::to_string(geteuid()), 0x7777); // as an attacker would create it
     EXPECT_EQ(InstanceSocketPath(), QString());
     EXPECT_FALSE(CInstanceServer(Remember()).IsListening());
     EXPECT_FALSE(RaiseFirstInstance());

@@ -58,7 +58,7 @@ void ChooseOption(CPerson& person, int row)
     ASSERT_TRUE(WaitUntil([] { return !QApplication::activePopupWidget(); }));
 }
 
-// The example's motion with names that say nothing.
+// Writes the example motion with meaningless names.
 std::string NamelessWalk(const std::string& folder)
 {
     std::istringstream lines(ReadBytes(ExampleFile("walk.bvh")));
@@ -113,7 +113,7 @@ TEST(MainWindow, AMotionIsOpenedConvertedPlayedAndSaved)
     EXPECT_TRUE(person.Place().startsWith(QStringLiteral("frame 65 of 66")));
 
     const std::string saved = person.Home().Path("walk.Kinetra");
-    person.WillChooseFile(person.Home().Path("walk")); // the extension is the dialog's
+    person.WillChooseFile(person.Home().Path("walk")); // the dialog adds the extension
     person.WillAnswer("cancel");
     person.Type(Qt::Key_S, Qt::ControlModifier);
     EXPECT_TRUE(FileExists(saved));
@@ -212,7 +212,7 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     }
     EXPECT_TRUE(FileExists(folder + "a.htr") && FileExists(folder + "b.htr"));
 
-    // A release that went to another program leaves no key behind.
+    // A key release sent to another program leaves no key pressed.
     person.PressLeft(EKey::LeftCtrl, &person.Frame());
     person.ReleaseLeft(EKey::LeftCtrl, nullptr);
     person.WillChooseFile({});
@@ -230,7 +230,7 @@ TEST(MainWindow, RightKeysAreNotLeftKeys)
     CPerson person;
     QKeyEvent right(QEvent::KeyPress, Qt::Key_Control, Qt::ControlModifier, 0, 0xffe4, 0);
     QApplication::sendEvent(&person.Frame(), &right);
-    OpenWalk(person); // the batch would have asked for a folder
+    OpenWalk(person); // a batch would have asked for a folder
     EXPECT_TRUE(person.Content().SourceRoot());
 }
 
@@ -283,7 +283,7 @@ TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
 
 TEST(MainWindow, ABoneMapIsDraftedForASourceThatNoneFits)
 {
-    constexpr int kDraft = 3; // behind the separator
+    constexpr int kDraft = 3; // after the separator
     CPerson person;
     person.Drop(NamelessWalk(person.Home().Path()));
     person.Click("convert");

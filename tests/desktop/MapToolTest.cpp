@@ -1,4 +1,4 @@
-// Stories of a person at the map tool's window.
+// Sessions of a user with the map tool's window.
 
 #include "CDialogAnswers.h"
 #include "CGaitToolWindow.h"
@@ -44,7 +44,7 @@ protected:
         return child;
     }
     void Click(const char* button) const { QTest::mouseClick(Child<QPushButton>(button), Qt::LeftButton); }
-    /// Clicks a button and does something in the dialog that it opens.
+    /// Clicks a button and acts in the dialog that it opens.
     template <class F>
     void ClickAnd(const char* button, F answer) const
     {
@@ -52,7 +52,7 @@ protected:
         const CDialogAnswers answers([&](QWidget& dialog) { answer(dynamic_cast<QDialog&>(dialog)); });
         Click(button);
     }
-    /// Clicks a button and gives its file dialog a file of the temporary folder.
+    /// Clicks a button and selects a file of the temporary folder in its file dialog.
     void ClickFile(const char* button, const std::string& file) const
     {
         ClickAnd(button, [&](QDialog& dialog) {
@@ -253,7 +253,7 @@ TEST_F(MapToolTest, TheProgramRunsUntilTheToolIsClosed)
     EXPECT_EQ(RunMapTool(m_kPlatform, m_kKeys), 0);
 }
 
-// At the smallest size that the window takes.
+// At the window's minimum size.
 TEST_F(MapToolTest, EverythingIsNamedAndNothingIsCut)
 {
     LoadSourceAndMap();

@@ -1,4 +1,4 @@
-// Questions and words: what each set of buttons answers to hand, keyboard and close box.
+// Message boxes: the answers of each set of buttons to mouse, keyboard and close box.
 
 #include "CDialogAnswers.h"
 #include "CMessageBox.h"
@@ -19,7 +19,7 @@ namespace {
 
 using Act = std::function<void(QWidget&)>;
 
-// Shows a box, does something to it once it stands, and answers what it was answered with.
+// Shows a box, acts on it, and returns its answer.
 EAnswer Ask(EButtons buttons, const Act& act, const std::string& text = "Text",
             const std::string& details = {})
 {
@@ -75,7 +75,7 @@ TEST(MessageBox, EnterAnswersFirstAndWhatClosesAnswersMostCarefully)
     }
 }
 
-// A box at a moment: how large it is, and what of its parts is not where all of it can be seen.
+// Expects that every part of a box is completely visible.
 void ExpectAllInside(const QWidget& box)
 {
     EXPECT_TRUE(box.screen()->availableGeometry().contains(box.geometry()));
@@ -96,7 +96,7 @@ TEST(MessageBox, TextsOfFilesArePlainAndNeverCut)
             EXPECT_EQ(label->textFormat(), Qt::PlainText);
             EXPECT_EQ(label->accessibleName().toStdString(), path);
             EXPECT_GE(label->height(), label->heightForWidth(label->width()));
-            // Every letter has its place: a label that cannot wrap would be wider than it is.
+            // All text fits: a label that cannot wrap would be wider than it is.
             EXPECT_LE(label->minimumSizeHint().width(), label->width());
             ExpectAllInside(box);
             box.close();

@@ -1,4 +1,4 @@
-// Choosing a folder, by hand and by its path.
+// Selecting a folder with the mouse and by its path.
 
 #include "CDialogAnswers.h"
 #include "CSelectFolderDialog.h"
@@ -18,7 +18,7 @@ namespace {
 
 constexpr const char* kFilter = "BVH file to HTR(*.bvh)|*.bvh|HTR file to ORN(*.htr)|*.htr|";
 
-// A folder with two folders and two files in it, and a person who chooses.
+// A folder with two folders and two files, and a user who selects one.
 class SelectFolder : public testing::Test
 {
 protected:
@@ -31,7 +31,7 @@ protected:
         WriteBytes(m_kFolder.Path("c.htr"), "c");
     }
 
-    // Opens the dialog in the folder. It goes with the next one.
+    // Opens the dialog in the folder, replacing an earlier dialog.
     CSelectFolderDialog& Open(const std::string& filter = {}, const std::string& initial = {})
     {
         m_pkDialog = std::make_unique<CSelectFolderDialog>(
@@ -59,8 +59,8 @@ protected:
             QTest::keyClick(edit, Qt::Key_Delete);
     }
 
-    // Waits until the list holds these names, those that cannot be chosen in brackets, and answers what it
-    // holds.
+    // Waits until the list contains these names, with brackets around those that cannot be selected, and
+    // returns its contents.
     std::vector<std::string> Listed(const std::vector<std::string>& expected)
     {
         auto* list = Child<QAbstractItemView>("folders");
@@ -80,7 +80,7 @@ protected:
     }
     void ExpectListed(const std::vector<std::string>& expected) { EXPECT_EQ(Listed(expected), expected); }
 
-    // Presses "select", and the button of the box that then comes up. Answers the box's text.
+    // Presses "select", and the button of the box that then opens. Returns the box's text.
     std::string SelectAndAnswer(const char* button)
     {
         std::string text;
@@ -122,7 +122,7 @@ TEST_F(SelectFolder, GoesIntoFoldersAndUpAgain)
     auto* list = Child<QAbstractItemView>("folders");
     list->setFocus();
     list->setCurrentIndex(list->model()->index(1, 0, list->rootIndex()));
-    EXPECT_EQ(Path() + '/', m_kFolder.Path()); // one that is only looked at is not open
+    EXPECT_EQ(Path() + '/', m_kFolder.Path()); // a folder that is only selected is not opened
     QTest::keyClick(list, Qt::Key_Return);
     EXPECT_EQ(Path(), m_kFolder.Path("day 2"));
     EXPECT_TRUE(m_pkDialog->isVisible());

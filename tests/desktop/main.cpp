@@ -4,7 +4,7 @@
 #include <QApplication>
 #include <gtest/gtest.h>
 
-// Nothing of the user's own settings and documents is read or written.
+// The user's own settings and documents are neither read nor written.
 int main(int argc, char** argv)
 {
     testing::InitGoogleTest(&argc, argv);

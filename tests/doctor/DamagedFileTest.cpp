@@ -1,4 +1,4 @@
-// Whatever bytes a file has: an answer, and never a healthy one where the file cannot be read.
+// Any bytes yield a result, and an unreadable file is never reported as healthy.
 
 #include "CMotionFile.h"
 #include "Examined.h"
@@ -20,7 +20,7 @@ std::string ShortWalk()
     return MadeWalk(style);
 }
 
-// What the reader says of a file and what the examination does must not contradict each other.
+// The reader's result and the examination must not contradict each other.
 void ExpectConsistent(const std::string& text)
 {
     CExamined examined(text);
@@ -94,7 +94,7 @@ TEST(DamagedFiles, ThatHoldNoMotionAreTold)
     EXPECT_EQ(missing.Findings().Sorted().at(0).reason, EFailure::NotFound);
 }
 
-// Files of many programs, of which each finding was looked at. They are too large for this repository.
+// Files of many programs, whose findings were each verified. They are too large for this repository.
 TEST(RealFiles, HaveTheFaultsThatTheyHave)
 {
     const struct
@@ -103,7 +103,7 @@ TEST(RealFiles, HaveTheFaultsThatTheyHave)
         const char* faults;
     } rows[] = {
         {"bandai_walk_normal_002.bvh", "12 doubled-offset"},
-        {"cmu_cgspeed_example.bvh", "411 spike"}, // the right thumb is turned by 177 degrees for two frames
+        {"cmu_cgspeed_example.bvh", "411 spike"}, // the right thumb is rotated by 177 degrees for two frames
         {"geno_stance.bvh", "4 doubled-hip-offset, 8 doubled-offset"},
         {"neuron_milad.bvh", "4 doubled-hip-offset, 8 doubled-offset, 350 empty-line-before-frames"},
         {"poser_boxing.bvh", "4 doubled-hip-offset, 8 doubled-offset"},
@@ -121,7 +121,7 @@ TEST(RealFiles, HaveTheFaultsThatTheyHave)
         const auto* const row =
             std::ranges::find(rows, name, [](const auto& r) { return std::string(r.name); });
         CExamined examined(ReadBytes(folder + name));
-        const bool healthy = !examined.Exam().Findings().HasFaults(); // notes are no faults
+        const bool healthy = !examined.Exam().Findings().HasFaults(); // notes are not faults
         EXPECT_EQ(healthy ? "" : examined.Found(), row == std::end(rows) ? "" : row->faults);
         const bool mends = examined.Exam().Findings().MendsAny();
         EXPECT_FALSE(mends && CExamined(examined.Mended()).Exam().Findings().HasFaults());

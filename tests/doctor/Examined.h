@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// A text that was examined as a BVH file of its own.
+/// A text that was examined as a BVH file.
 class CExamined
 {
 public:
@@ -16,11 +16,11 @@ public:
 
     const std::string& Path() const { return m_kPath; }
     CFileExam& Exam() { return m_kExam; }
-    /// All that was found, as "12 blank-in-name, 40 spike": line and code.
+    /// Returns all findings, as "12 blank-in-name, 40 spike": line and code.
     std::string Found() const;
-    /// Whether the reader takes the file.
+    /// Returns whether the reader accepts the file.
     bool Loads() const;
-    /// The text of a mended copy.
+    /// Returns the text of a repaired copy.
     std::string Mended();
 
 private:

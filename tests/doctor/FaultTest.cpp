@@ -1,5 +1,5 @@
-// One healthy file, and one fault in it at a time: exactly that one is found, and where it can be mended the
-// copy is the healthy file again.
+// A healthy file with one fault at a time: exactly that fault is found and, if it can be repaired, the copy
+// equals the healthy file.
 
 #include "Examined.h"
 #include "MadeWalk.h"
@@ -42,8 +42,8 @@ std::string WithoutLastValue(const std::string& row)
 
 enum class EEnd
 {
-    Restored, // mending gives the healthy text again, byte for byte
-    Mended,   // a text that is healthy in another way
+    Restored, // the repaired text equals the healthy one, byte for byte
+    Mended,   // a different healthy text
     Stays,
 };
 
@@ -99,7 +99,7 @@ Change Around(std::string_view before, std::string_view behind)
     return [=](const std::string& walk) { return std::string(before) + walk + std::string(behind); };
 }
 
-// Lines are those of the made walk: 2 ROOT Hips, 6 JOINT LeftUpLeg, 10 JOINT LeftLeg, 101 MOTION.
+// Lines refer to the made walk: 2 ROOT Hips, 6 JOINT LeftUpLeg, 10 JOINT LeftLeg, 101 MOTION.
 std::vector<FaultCase> Cases()
 {
     const std::string walk = MadeWalk();
@@ -213,7 +213,7 @@ TEST(Faults, OfOneKindAreCountedBehindTheFirst)
     EXPECT_EQ(found.back().more, 30u);
 }
 
-// A gap of one frame is filled on the way from one side to the other; a longer one is nobody's to fill.
+// A gap of one frame is interpolated; a longer one is not filled.
 TEST(Faults, OfValuesAreMendedByTheirNeighbours)
 {
     const std::string walk = MadeWalk();
@@ -221,7 +221,7 @@ TEST(Faults, OfValuesAreMendedByTheirNeighbours)
     EXPECT_NEAR(ValueOf(one, kFrame, kThighX),
                 (ValueOf(walk, kFrame - 1, kThighX) + ValueOf(walk, kFrame + 1, kThighX)) / 2.0, 1e-5);
 
-    // The short way round where angles jump by a whole turn.
+    // The shorter way if angles jump by a whole turn.
     std::string turned = GiveValue(kFrame - 1, kThighX, "178")(walk);
     turned = GiveValue(kFrame, kThighX, "nan")(GiveValue(kFrame + 1, kThighX, "-178")(turned));
     EXPECT_NEAR(std::fabs(ValueOf(CExamined(turned).Mended(), kFrame, kThighX)), 180.0, 1e-5);
@@ -247,7 +247,7 @@ TEST(Faults, OfDecimalCommasAreMended)
     EXPECT_TRUE(ill.Found().starts_with("4 decimal-comma, 8 decimal-comma")) << ill.Found();
     EXPECT_EQ(ill.Found().find("row"), std::string::npos) << ill.Found();
     EXPECT_TRUE(ill.Mended() == walk);
-    // Commas that separate are none.
+    // Commas that separate values are not decimal commas.
     EXPECT_EQ(CExamined(AllReplaced(walk, " 0.000000", ",0.000000")).Found(), "");
 }
 

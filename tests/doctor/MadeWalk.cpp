@@ -12,7 +12,7 @@ namespace gw {
 namespace {
 
 constexpr double kStrideSeconds = 1.1;
-constexpr double kSwing = 25.0; // degrees of a thigh to each side
+constexpr double kSwing = 25.0; // in degrees, of a thigh to each side
 constexpr double kLeg = 82.0;
 constexpr float kHipHeight = 90.0f;
 
@@ -21,8 +21,8 @@ struct JointRow
     const char* name;
     int depth;
     Vec3 offset;  // cm
-    double turn;  // degrees about X at the end of a swing
-    double onset; // of the stride
+    double turn;  // in degrees about X at the end of a swing
+    double onset; // fraction of the stride
 };
 
 constexpr JointRow kJoints[] = {
@@ -39,7 +39,7 @@ constexpr JointRow kJoints[] = {
     {"Head", 4, {0.0f, 10.0f, 1.0f}, 1.0, 0.8},
 };
 
-// A leg swings evenly, so that the foot on the ground stands while the hip goes on.
+// A leg swings at constant speed, so that the foot on the ground stands while the hip moves on.
 double Wave(double strides)
 {
     return std::asin(std::sin(2.0 * kPi64 * strides)) / kHalfPi64;
@@ -66,7 +66,7 @@ std::vector<JointRow> JointsOf(const WalkStyle& style)
     return joints;
 }
 
-// Where a line begins; the end of the text for one behind it.
+// Returns where a line starts; the end of the text for a line after the last one.
 size_t BeginOf(std::string_view text, size_t number)
 {
     size_t at = 0;
@@ -92,7 +92,7 @@ std::string MadeWalk(const WalkStyle& style)
     std::vector<TextJoint> joints;
     for (const JointRow& row : rows)
     {
-        // The joint before that stands one step higher.
+        // The closest earlier joint that is one level higher.
         const auto isAbove = [&](const JointRow& other) { return other.depth == row.depth - 1; };
         const auto above =
             std::find_if(rows.rend() - static_cast<ptrdiff_t>(joints.size()), rows.rend(), isAbove);

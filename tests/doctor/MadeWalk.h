@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// How a made walk is written. Lengths are centimetres times `unit`.
+/// How a made walk is written. Lengths are centimeters times `unit`.
 struct WalkStyle
 {
     int frames = 90;
@@ -15,29 +15,30 @@ struct WalkStyle
     bool zUp = false;
     bool toes = true;
     bool sixChannels = false;    ///< positions on every joint, as differences from the offsets
-    bool repeatsOffsets = false; ///< positions on every joint, as the offsets over again
-    bool hipOffset = false;      ///< the root's offset holds the height of the hip that its channels hold too
-    bool rootBelow = false;      ///< a root "Reference" above the hip
-    bool scientific = false;     ///< numbers like 9.0000000e+01
+    bool repeatsOffsets = false; ///< positions on every joint, repeating the offsets
+    /// the root's offset contains the hip's height, which its channels contain too
+    bool hipOffset = false;
+    bool rootBelow = false;  ///< a root "Reference" above the hip
+    bool scientific = false; ///< numbers like 9.0000000e+01
 };
 
-/// A person who walks 0.69 m a step, as the text of a BVH file without any fault.
+/// Returns a person who walks 0.69 m per step, as the text of a correct BVH file.
 std::string MadeWalk(const WalkStyle& style = {});
 
-/// A text with one part replaced by another, which must be there; of several the first one behind a mark.
+/// Returns a text with one part replaced, which must occur; of several, the first one after a mark.
 std::string Replaced(std::string text, std::string_view part, std::string_view instead,
                      std::string_view behind = {});
-/// A text with all parts of a kind replaced.
+/// Returns a text with all occurrences replaced.
 std::string AllReplaced(std::string text, std::string_view part, std::string_view instead);
-/// The number of the row of a frame in the text of a made walk, from 1 on.
+/// Returns the line number of a frame's row in a made walk, starting at 1.
 size_t LineOfFrame(std::string_view text, int frame);
-/// A text with one line replaced; it is given without its line end.
+/// Returns a text with one line replaced, given without its line end.
 std::string WithLine(std::string_view text, size_t number, std::string_view line);
-/// A line of a text without its end.
+/// Returns a line of a text without its end.
 std::string LineOf(std::string_view text, size_t number);
-/// The value in a column of a frame's row.
+/// Returns the value in a column of a frame's row.
 double ValueOf(std::string_view text, int frame, size_t column);
-/// A row with the value in a column given anew.
+/// Returns a row with a new value in a column.
 std::string WithValue(std::string_view row, size_t column, std::string_view value);
 
 } // namespace gw

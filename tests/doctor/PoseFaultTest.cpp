@@ -1,5 +1,4 @@
-// Faults that only the poses show, each in a walk that is healthy but for it, and what looks like them and is
-// none.
+// Faults that only the poses show, each in an otherwise healthy walk, and harmless look-alikes.
 
 #include "CMotionFile.h"
 #include "Examined.h"
@@ -63,7 +62,7 @@ TEST(PoseFaults, AreFound)
 TEST(PoseFaults, AreNotFoundInWhatLooksLikeThem)
 {
     WalkStyle other;
-    other.rate = other.declaredRate = 47.0; // nobody's rate, and right
+    other.rate = other.declaredRate = 47.0; // an unusual rate, but correct
     other.frames = 150;
     const std::string walk = MadeWalk();
     WalkStyle brief;
@@ -87,7 +86,7 @@ TEST(PoseFaults, OfOffsetsAreMendedToBonesOfTheirLength)
     style.repeatsOffsets = true;
     EXPECT_TRUE(CExamined(MadeWalk(style)).Mended() == healthy);
 
-    // One joint that is the other way is left as it is.
+    // A single joint with different positions is left alone.
     const auto withHead = [](std::string text, std::initializer_list<const char*> position) {
         for (size_t axis = 0; axis < 3; ++axis)
         {
@@ -111,7 +110,7 @@ TEST(PoseFaults, OfOffsetsAreMendedToBonesOfTheirLength)
     EXPECT_FLOAT_EQ(motion.motionRoot->m_kWorldMatrix.Translation().y, 90.0f);
 }
 
-// What is put in the place of a spike is the way between the frames beside it, and no other value changes.
+// A spike is replaced by interpolating between its neighbors, and no other value changes.
 TEST(PoseFaults, OfOneFrameAreMendedInPlace)
 {
     const std::string walk = MadeWalk();
@@ -119,7 +118,7 @@ TEST(PoseFaults, OfOneFrameAreMendedInPlace)
     const size_t line = LineOfFrame(walk, 40);
     EXPECT_TRUE(WithLine(mended, line, "") == WithLine(walk, line, ""));
     EXPECT_NEAR(ValueOf(mended, 40, kHandY), ValueOf(walk, 40, kHandY), 1e-5);
-    // The short way round where angles jump by a whole turn.
+    // The shorter way if angles jump by a whole turn.
     std::string turned = walk;
     for (int frame = 30; frame < 50; ++frame)
         turned = WithValues(turned, frame, kHandY, {frame < 40 ? "178" : frame == 40 ? "75" : "-178"});

@@ -1,7 +1,7 @@
-// Loaded before a program, this makes one call of one kind fail: the FAULT_NUMBERth that the program and its
-// worker processes make of FAULT_OPERATION, from the start of its main function on. How many they made is
-// written to FAULT_REPORT when it ends. Calls that the system's library makes for itself are not met. The
-// calls that FAULT_MISSING names (flock, link, renameat2) always fail, as on a file system that lacks them.
+// Loaded before a program, this makes one call fail: call number FAULT_NUMBER of FAULT_OPERATION by the
+// program and its worker processes, counted from the start of main. The number of calls is written to
+// FAULT_REPORT at the end. Calls within the system's library are not intercepted. Calls named in
+// FAULT_MISSING (flock, link, renameat2) always fail, as on a file system without them.
 
 #include <atomic>
 #include <cerrno>
@@ -19,7 +19,7 @@
 #include <sys/syscall.h>
 #include <unistd.h>
 
-// What allocates inside the system's library, under the names that stay when malloc is another.
+// Allocation functions inside the system's library, under the names that remain when malloc is replaced.
 extern "C" void* __libc_malloc(size_t size);
 extern "C" void* __libc_calloc(size_t count, size_t size);
 extern "C" void* __libc_realloc(void* block, size_t size);
@@ -41,7 +41,7 @@ enum class EOperation : int
     Allocate,
 };
 
-// By EOperation.
+// Indexed by EOperation.
 constexpr const char* kNames[] = {"none",  "open", "read", "write",   "rename",  "sync",
                                   "close", "map",  "mode", "reserve", "allocate"};
 
@@ -49,7 +49,7 @@ using Count = std::atomic<long>;
 
 EOperation g_eOperation = EOperation::None;
 long g_iNumber = 0;
-Count* g_pkCalls = nullptr; // of the program and the processes that work for it
+Count* g_pkCalls = nullptr; // of the program and its workers
 
 bool IsDue(EOperation operation)
 {
@@ -68,7 +68,7 @@ int Refuse(int error)
     return -1;
 }
 
-// The function that would have been called.
+// Returns the function that is being intercepted.
 template <class F>
 F* Next(const char* name)
 {
@@ -90,7 +90,7 @@ void Begin()
     }
 }
 
-// By calls of the system, so that telling is no call that counts.
+// Uses system calls, so that reporting does not count as a call.
 void Report()
 {
     g_eOperation = EOperation::None;
@@ -123,7 +123,7 @@ mode_t ModeOf(int flags, va_list arguments)
 
 extern "C" {
 
-// What the system starts a program with: the way to be there from main on, behind all that is made before it.
+// The system starts programs through this function, so counting starts with main, after all initialization.
 int __libc_start_main(int (*main)(int, char**, char**), int argc, char** argv, void (*init)(), void (*fini)(),
                       void (*loaderFini)(), void* stackEnd)
 {
@@ -210,7 +210,7 @@ int fchmod(int file, mode_t mode)
     return IsDue(EOperation::Mode) ? Refuse(EPERM) : static_cast<int>(syscall(SYS_fchmod, file, mode));
 }
 
-// The file is closed all the same: what fails is what the file system had still to do.
+// The file is closed anyway; the failure is in what the file system still had to do.
 int close(int file)
 {
     const bool due = IsDue(EOperation::Close);

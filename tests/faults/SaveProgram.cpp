@@ -1,5 +1,5 @@
-// Saves what the desktop program saves, each by the code that it uses: a profile from the editor, a setting,
-// the lines of a map. Answers as the command line does.
+// Saves what the desktop program saves, with the same code: a profile from the editor, a setting, the lines
+// of a map. Exit codes are the command line's.
 
 #include "CFilePlatform.h"
 #include "CProfileEditorDialog.h"
@@ -14,7 +14,7 @@
 namespace gw {
 namespace {
 
-// A program around the editor whose only profile is a given one, and which says yes to all.
+// An owner for the editor with a single given profile, which answers yes to everything.
 class COwnerOfOne : public CProfileOwner
 {
 public:
@@ -36,7 +36,7 @@ bool SaveProfile(const std::string& path)
     COwnerOfOne owner(path);
     CProfileEditorDialog editor(owner);
     int total = 0;
-    editor.ReadProfile(path, nullptr, &total, EProfileRead::Load); // false where bones are not there
+    editor.ReadProfile(path, nullptr, &total, EProfileRead::Load); // false if bones are missing
     if (total == 0)
         return false;
     editor.AddMapRow("Skull", "Head", {});

@@ -39,7 +39,7 @@ bool CNamedBody::MayDrive(const std::string& target, std::string_view joint) con
     return targets != m_kTargets.end() && std::ranges::count(Words(targets->second), target) == 1;
 }
 
-// `side` is 1 for the body's left, -1 for its right, 0 for the trunk.
+// Returns the name of a side's joint; `side` is 1 for the body's left, -1 for its right, 0 for the trunk.
 std::string CNamedBody::NameFor(std::string name, float side) const
 {
     const bool isLeft = (side > 0.0f) != (m_kChange.names == BodyChange::SidesSwapped);
@@ -54,7 +54,7 @@ std::string CNamedBody::NameFor(std::string name, float side) const
 
 int CNamedBody::Add(int parent, const std::string& name, std::string_view targets, float x, float y, float z)
 {
-    // A shin's end is the ankle, and the foot goes on in front of it; everything else goes on as it came.
+    // A shin's end is the ankle, and the foot is in front of it; all other bones continue straight.
     const Vec3 tip = y < -30.0f ? Vec3{0.0f, -7.0f, 13.0f} : Vec3{x / 2.0f, y, z};
     m_kJoints.push_back({name, parent, {x, y, z}, tip});
     m_kTargets[name] = targets;
@@ -93,7 +93,7 @@ void CNamedBody::AddArm(int chest, float side)
     if (m_kChange.names == BodyChange::ArmsExchanged)
         std::swap(names[0], names[1]);
     const bool shifted = m_kChange.names == BodyChange::ArmsShifted;
-    if (shifted) // what lies where the clavicle would is not there
+    if (shifted) // the joint in the clavicle's place is missing
         names.insert(names.begin(), "-");
     const std::string letter = side > 0.0f ? "L" : "R";
     int joint = chest;
@@ -104,7 +104,7 @@ void CNamedBody::AddArm(int chest, float side)
         if (names[i] == "-")
             continue;
         const std::string target = i < std::size(kBones) ? letter + kBones[i] : "";
-        // The collar drives the torso of the stock profile that knows no number of chest joints.
+        // The collar drives the torso of the stock profile that works for any number of chest joints.
         const std::string also = i == 0 && side > 0.0f ? " UpperTorso" : "";
         joint = Add(joint, NameFor(names[i], side), target + also, side * out, joint == chest ? 14.0f : 0.0f,
                     0.0f);

@@ -11,9 +11,8 @@
 
 namespace gw {
 
-/// What a source of motions calls the joints of a body. Lists go upward or outward, with blanks in between
-/// and
-/// "-" for a joint that is not there. In names of a side, * stands for the side's word, + for its letter.
+/// How a source of motions names the joints of a body. Lists go upward or outward, separated by blanks, with
+/// "-" for a missing joint. In side names, * is replaced by the side's word and + by its letter.
 struct Convention
 {
     const char* what;
@@ -25,7 +24,7 @@ struct Convention
 };
 std::span<const Convention> Conventions();
 
-/// How a skeleton differs from what its convention says.
+/// How a skeleton differs from its convention.
 struct BodyChange
 {
     const char* what;
@@ -38,24 +37,24 @@ struct BodyChange
     } letters = AsTheyAre;
     bool toes = true;
     bool fingers = false;
-    /// How the names lie: what is wrong must not be taken in silence.
+    /// How the names are wrong; such bodies must not be accepted without a warning.
     enum ENames
     {
         Right,
         SidesSwapped,  ///< left names on the right side
-        ArmsExchanged, ///< clavicle and upper arm have each other's name
-        ArmsShifted,   ///< no clavicle, and its name on the upper arm; so on outward
+        ArmsExchanged, ///< clavicle and upper arm have swapped names
+        ArmsShifted,   ///< no clavicle: the upper arm has its name, and so on outward
     } names = Right;
 };
 
-/// A human body in a T-pose that looks along z, in cm, read from a motion file of two frames.
+/// A human body in a T-pose facing z, in cm, read from a motion file of two frames.
 class CNamedBody
 {
 public:
     CNamedBody(const Convention& convention, const BodyChange& change);
 
     CNode& Root() const { return *m_kMotion.motionRoot; }
-    /// Whether a target bone of the host skeleton may be driven by a joint of this name.
+    /// Returns whether a joint with this name may drive a target bone of the host skeleton.
     bool MayDrive(const std::string& target, std::string_view joint) const;
 
 private:
@@ -70,7 +69,8 @@ private:
     const Convention& convention_;
     BodyChange m_kChange;
     std::vector<TextJoint> m_kJoints;
-    std::map<std::string, std::string> m_kTargets; ///< the targets that a joint may drive, in words
+    /// the targets that a joint may drive, separated by blanks
+    std::map<std::string, std::string> m_kTargets;
     CMotionFile m_kMotion;
 };
 

@@ -41,7 +41,7 @@ protected:
         EXPECT_EQ(some.empty() ? "" : some.front().profile.name, all.empty() ? "" : all.front().profile.name);
         return all;
     }
-    /// Writes a profile that drives the hips and what else is told.
+    /// Writes a profile that drives the hips, with additional rows.
     std::string Profile(const std::string& name, const std::string& rows)
     {
         const std::string path = m_kFolder.Path(name + ".prf");
@@ -144,7 +144,7 @@ TEST_F(Choose, TheSourceStandsAsItStoodBefore)
 {
     const CNamedBody body(kHumanIK, {"plain"});
     std::vector<CNode*> nodes = NodesOf(body.Root());
-    for (size_t i = 0; i < nodes.size(); ++i) // as some frame may have left it
+    for (size_t i = 0; i < nodes.size(); ++i) // as some frame may have left them
         nodes[i]->m_kMatrix.m[12] = nodes[i]->m_kWorldMatrix.m[13] = static_cast<float>(i);
     Of(body.Root());
     for (size_t i = 0; i < nodes.size(); ++i)
@@ -181,13 +181,13 @@ TEST(SharedPrefix, NearlyAllNamesMustHaveIt)
     EXPECT_TRUE(SharedPrefixes({}).empty());
 }
 
-// Real motions of many makers: what is taken, or why not.
+// Real motions of many programs: the chosen profile, or the reason for none.
 TEST_F(Choose, RealMotions)
 {
     const std::string folder = SharedDataFolder();
     if (folder.empty())
         GTEST_SKIP() << "no shared data here";
-    // name: empty where nothing fits
+    // name: empty if nothing fits
     const std::tuple<const char*, const char*, ESureness> rows[] = {
         {"bandai_walk_normal_002", "Bandai Namco (2 spine joints)", ESureness::Sure},
         {"cmu_cgspeed_example", "CMU, MotionBuilder names (3 spine joints, fingers)", ESureness::Sure},
@@ -218,7 +218,7 @@ TEST_F(Choose, RealMotions)
     }
 }
 
-// The two stock profiles of old are taken where they fit, so that a false alarm would be a daily nuisance.
+// The original stock profiles are used whenever they fit, so a false alarm would be a daily nuisance.
 TEST_F(Choose, NothingIsSaidAboutWhichJointIsWhichWhereAllIsWell)
 {
     const std::string folder = SharedDataFolder();

@@ -39,12 +39,12 @@ enum class EOutcome
 {
     Right,
     Refused, // doubtful, or nothing fits
-    Warned,  // taken with a doubt about which joint is which
-    Silent,  // wrong, and nothing said
+    Warned,  // used, with a doubt about a joint's role
+    Silent,  // wrong without a warning
 };
 constexpr const char* kOutcomeNames[] = {"right", "refused", "warned", "silent"};
 
-// The two stock profiles of old go before all others where they fit.
+// The original stock profiles come before all others if they fit.
 const ProfileChoice& Taken(const std::vector<ProfileChoice>& choices, bool& isOld)
 {
     for (const char* old : {"PoserBVH.prf", "MaxBVH.prf"})
@@ -85,7 +85,7 @@ protected:
             m_kPaths.push_back(std::string(kAssets) + file);
     }
 
-    /// Holds all profiles against a skeleton and says how the one that is taken does.
+    /// Matches all profiles with a skeleton and rates the chosen one.
     EOutcome Try(const Convention& convention, const BodyChange& change)
     {
         const CNamedBody body(convention, change);
@@ -106,7 +106,7 @@ protected:
             return EOutcome::Right;
         return SaysWhichIsWhich(taken.verdict) ? EOutcome::Warned : EOutcome::Silent;
     }
-    /// The outcomes, a line each, for who asks for them.
+    /// Prints the outcomes, one per line, on request.
     ~NameTable() override
     {
         if (std::getenv("GAITWRIGHT_NAME_TABLE"))

@@ -31,7 +31,7 @@ const SuggestedRow& RowOf(const SuggestedProfile& profile, std::string_view targ
     return *std::ranges::find(profile.rows, target, &SuggestedRow::target);
 }
 
-// What comes of a conversion by a profile's rows and the rules alone, out of its file.
+// Converts with a profile's rows, without options, and reads the result from its file.
 std::unique_ptr<CMotionFile> Convert(const CMotionFile& source, const CMapRowTable& rows)
 {
     const auto target = LoadTarget();
@@ -67,7 +67,7 @@ TEST(SuggestProfile, EveryMadeSkeletonPointsAsItsSourceAtRest)
     for (const std::string& recipe : SkeletonRecipes())
     {
         SCOPED_TRACE(recipe);
-        // A collar without a source shares the arm's rotation, and the arm below it is a degree or two off.
+        // A collar without a source shares the arm's rotation, so the arm below it is a degree or two off.
         const double share = recipe.find("noclavicle") == recipe.npos ? 0.0 : 1.0;
         const CMadeSkeleton made(recipe, 1);
         const CMadeSkeleton atRest(recipe + " rest", 1);
@@ -118,7 +118,7 @@ TEST(SuggestProfile, ATPoseThatLooksAlongZNeedsNoTurns)
     const auto target = LoadTarget();
     const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
     const auto result = Convert(CMadeSkeleton("metres rest", 1).Motion(), profile.Table());
-    // Every bone stands nearly as it does in the target's own rest pose, turns about itself included.
+    // Every bone is nearly as in the target's own rest pose, including its twist.
     result->motionRoot->UpdateTransform(0.0f);
     const auto rest = LoadTarget();
     for (const char* name : {"UpperTorso", "Head", "LUpperArm", "LForearm", "LHand", "RUpperArm", "RHand"})
@@ -175,7 +175,7 @@ TEST(SuggestProfile, NamesThatAProfileCannotHoldAreLeftOut)
     {
         SCOPED_TRACE(name);
         const CMadeSkeleton made("", 1);
-        made.Root().SetName("Hips"); // the last name would stand for the hip
+        made.Root().SetName("Hips"); // otherwise the last name would be used for the hip
         const BodyPlace place{EBodyJoint::UpperArm, EBodySide::Right};
         FindBone(&made.Root(), made.NameAt(place))->SetName(name);
         const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
@@ -199,7 +199,7 @@ TEST(NearestOffset, HoldsTheAxisToLessThanADegree)
         mean += AngleBetween(offset.Row(1), rotation.Row(1)) / 500.0;
         EXPECT_GT(Vec3Dot(offset.Row(1), rotation.Row(1)), std::cos(0.75f * kDegreesToRadians));
         EXPECT_GT(Vec3Dot(offset.Row(0), rotation.Row(0)), std::cos(2.5f * kDegreesToRadians));
-        // Axis codes take the quarter turns, so that what is left is small.
+        // Axis codes represent the quarter turns, so the remaining angles are small.
         for (const int degrees : numbers.rotation)
             EXPECT_LE(std::abs(degrees), 65);
     }

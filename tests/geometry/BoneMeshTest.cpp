@@ -12,7 +12,7 @@
 namespace gw {
 namespace {
 
-// Six times the volume that the triangles enclose; above 0 where they look outward. Each edge must be there
+// Returns six times the volume enclosed by the triangles; positive if they face outward. Each edge must occur
 // once in each direction.
 double Volume(CTriMesh& mesh)
 {
@@ -126,10 +126,10 @@ TEST(AttachBoneMeshes, BranchesAreBallsThatTheirLastChildSizes)
 {
     const Ref<CNode> hip = new CNode;
     AddNode(*hip, {2, 0, 0});
-    AddNode(*hip, {0, 3, 0});               // Y dominates: the turn of the child before stays
+    AddNode(*hip, {0, 3, 0});               // Y dominates: the previous child's rotation is kept
     CNode* last = AddNode(*hip, {4, 4, 0}); // nothing dominates
     AddNode(*last, {-1, 0, 0});
-    hip->AttachChild(new CBillboardNode); // a derived class is no bone
+    hip->AttachChild(new CBillboardNode); // a derived class is not a bone
     AttachBoneMeshes(hip.Get());
     const CBoneMesh* mesh = FindBoneMesh(*hip);
     EXPECT_EQ(mesh->GetRTTI(), &CBoneNodeMesh::ms_kRTTI);

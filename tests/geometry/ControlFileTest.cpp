@@ -6,7 +6,7 @@
 namespace gw {
 namespace {
 
-// What every control adds, without a target.
+// Adds the part that is common to all controls, without a target.
 CSceneBytes& Control(CSceneBytes& bytes, std::string_view className)
 {
     bytes.Root().Object(className, 1).Word(1).Float(2).Float(3).Float(4).Float(5).Byte(1).Words({0, 0});
@@ -87,7 +87,7 @@ TEST(ControlFile, MeshesAndBonesThatDieLeaveNothingBehind)
 {
     Ref<CNode> scene = ControlledScene();
     const Ref<CTriMesh> mesh = static_cast<CTriMesh*>(scene->ChildAt(0));
-    scene = nullptr; // takes the bone and the other mesh along
+    scene = nullptr; // deletes the bone and the other mesh too
     mesh->UpdateScene(1.5f, true);
     mesh->UpdateScene(2.5f, true);
     const auto& skin = static_cast<const CBoneSkinControl&>(*mesh->GetControl());

@@ -114,7 +114,7 @@ Ref<CNode> ControlledScene()
     root->AttachChild(circle);
     root->AttachChild(new CLine);
     root->AttachChild(new CRectangle);
-    root->AttachChild(new CNode); // no slot stays empty: a clone's children are packed
+    root->AttachChild(new CNode); // no slot stays empty, because a clone's children are packed
     return root;
 }
 

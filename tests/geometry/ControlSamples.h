@@ -22,7 +22,7 @@ inline Mat4 Moved(float x, float y, float z)
     return Mat4Compose(kMat3Identity, {x, y, z});
 }
 
-/// A geometry of points alone.
+/// Returns a geometry that only has points.
 inline Ref<CTriMesh> PointMesh(const std::vector<Vec3>& points)
 {
     Ref<CTriMesh> mesh = new CTriMesh;
@@ -31,7 +31,7 @@ inline Ref<CTriMesh> PointMesh(const std::vector<Vec3>& points)
     return mesh;
 }
 
-/// One triangle at (0, 0, 0), (1, 0, 0), (0, 1, 0), with a normal for each corner.
+/// Returns one triangle at (0, 0, 0), (1, 0, 0), (0, 1, 0), with a normal per corner.
 inline Ref<CTriMesh> Triangle()
 {
     Ref<CTriMesh> mesh = PointMesh({kVec3Zero, kVec3UnitX, kVec3UnitY});
@@ -42,8 +42,8 @@ inline Ref<CTriMesh> Triangle()
     return mesh;
 }
 
-/// A tree with an object of each class of the room and no value at its default. Bones come behind the meshes
-/// that they move, and what two controls share is shared.
+/// Returns a tree with an object of each class of the room and no default values. Bones come after the meshes
+/// that they move, and data shared by two controls is shared.
 Ref<CNode> ControlledScene();
 
 } // namespace gw

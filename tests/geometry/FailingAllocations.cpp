@@ -15,7 +15,7 @@ void* operator new(size_t size)
     throw std::bad_alloc();
 }
 
-// The sanitizer has one of its own, whose memory may not be freed below.
+// The sanitizer has its own operator, whose memory must not be freed by the one below.
 void* operator new(size_t size, const std::nothrow_t&) noexcept
 {
     return g_iAllocationsLeft == 0 ? nullptr : std::malloc(size);

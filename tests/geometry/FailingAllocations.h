@@ -1,4 +1,4 @@
 #pragma once
 
-/// How many allocations of this test program succeed before all fail; below 0 none fails.
+/// The number of allocations in this test program that succeed before all fail; negative for no limit.
 extern int g_iAllocationsLeft;

@@ -12,8 +12,8 @@
 namespace gw {
 namespace {
 
-// A mesh of one triangle in which each count stands for itself: no normals although there are 5, no colours
-// although there are -6, 7 render vertices of which only the normals have a list.
+// Returns a mesh of one triangle with inconsistent counts: no normals although there are 5, no colors
+// although there are -6, and 7 render vertices of which only the normals have a list.
 CSceneBytes OddMesh(uint32_t presence)
 {
     CSceneBytes bytes;
@@ -53,7 +53,7 @@ TEST(MeshFile, PointsBelowNoneAreNoneAndOtherBlocksBelowNoneAreDamage)
     ASSERT_TRUE(LoadBytes(stream, none.Bytes()));
     CTriMesh& mesh = static_cast<CTriMesh&>(*stream.GetRoot(0));
     mesh.UpdateScene(0.0f, true);
-    mesh.BuildVertexTable(); // triangles without any list take no memory
+    mesh.BuildVertexTable(); // triangles without lists take no memory
     EXPECT_TRUE(mesh.VertexTriIndexBuffer().empty());
     EXPECT_EQ(mesh.GetTriangleQuantity(), 0x7fffffff);
 
@@ -143,7 +143,7 @@ TEST(Clone, MeshesShareTheCopyOfWhatTheyShare)
     EXPECT_EQ(bare->GetMaterial(), nullptr);
 }
 
-// Containers from another writer of the format: good ones keep their graph, all others do no harm.
+// Containers from another writer of the format: valid ones keep their graph, all others do no harm.
 TEST(ForeignContainers, SurviveLoadingAndSaving)
 {
     const std::string folder = SharedDataFolder();

@@ -16,7 +16,7 @@ public:
     CObject* CreateClone() const override { return new CTestMaterial(*this); }
 };
 
-/// A unit cube of 8 points and 12 triangles; each face has four normals of its own, 24 in all.
+/// Returns a unit cube of 8 points and 12 triangles; each face has its own four normals, 24 in total.
 inline Ref<CTriMesh> Cube(int32_t colorCount = 0)
 {
     Ref<CTriMesh> mesh = new CTriMesh;
@@ -37,7 +37,7 @@ inline Ref<CTriMesh> Cube(int32_t colorCount = 0)
     return mesh;
 }
 
-/// The cube with every block there is, two maps and a hole between them, and no value at its default.
+/// Returns the cube with every block, two maps with a null between them, and no default values.
 inline Ref<CTriMesh> FullMesh()
 {
     Ref<CTriMesh> mesh = Cube(2);

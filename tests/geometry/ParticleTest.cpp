@@ -6,7 +6,7 @@
 namespace gw {
 namespace {
 
-// A system at (0, 10, 0) whose particles start at its middle.
+// A system at (0, 10, 0) whose particles start at its center.
 struct System
 {
     explicit System(int32_t capacity, float rate)
@@ -49,7 +49,7 @@ TEST(Particles, AFullSystemEmitsNoneAndKeepsTheFraction)
 {
     System system(3, 1.25f);
     EXPECT_EQ(system.ActiveAt(4.0f), 3);
-    EXPECT_EQ(system.ActiveAt(6.0f), 3); // two and a half: the half stays
+    EXPECT_EQ(system.ActiveAt(6.0f), 3); // two and a half: the half is carried over
     system.particles->m_iParticleCount = 8;
     system.control->m_uiCapacity = 8;
     system.control->m_fRate = 0.5f;
@@ -76,7 +76,7 @@ TEST(Particles, AParticleMovesGrowsAndDies)
     };
     system.ActiveAt(1.0f);
     const Particle& particle = system.particles->Particles()[0];
-    expectPoint({2, 12, 0}); // moved in the step that bore it
+    expectPoint({2, 12, 0}); // moved in the step that created it
     EXPECT_FLOAT_EQ(particle.m_fSize, 30.5f);
     EXPECT_FLOAT_EQ(particle.m_fLife, 1.5f);
     EXPECT_EQ(particle.m_afColor[3], 0.4f);

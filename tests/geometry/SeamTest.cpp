@@ -18,7 +18,7 @@ void ExpectVector(const Vec3& v, const Vec3& expected)
 
 const float kDiagonal = std::sqrt(0.5f);
 
-// Two triangles: one faces +Z, the other lies 2 to the right and faces +X.
+// Two triangles: one faces +Z, the other is 2 to the right and faces +X.
 class TwoMeshes : public testing::Test
 {
 protected:
@@ -123,7 +123,7 @@ TEST_F(TwoMeshes, APointNamedTwiceMovesTwiceAndOneThatIsNotThereNever)
 TEST_F(TwoMeshes, NormalsAreSmoothedWhereOtherMeshesAreNear)
 {
     AttachSmoothing(1.25f);
-    // The first's normal 1 stands at (1, 0, 0), the second's 0 at (2, 0, 0); all others are farther apart.
+    // The first mesh's normal 1 is at (1, 0, 0), the second's 0 at (2, 0, 0); all others are farther apart.
     Update(1.0f);
     ExpectVector(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ);
     ExpectVector(m_kFirst->WorldNormalBuffer()[1], {kDiagonal, 0, kDiagonal});
@@ -144,7 +144,7 @@ TEST_F(TwoMeshes, ASelectedNormalThatNoCornerNamesBecomesZero)
     EXPECT_EQ(m_kFirst->WorldNormalBuffer()[1], kVec3Zero);
 }
 
-// The rule told as it stands, over every pair, against what the cells find.
+// Compares the literal rule, over every pair, with the result of the cells.
 TEST(Smoothing, CellsFindWhatIsNearAndNothingElse)
 {
     std::mt19937 random(3);

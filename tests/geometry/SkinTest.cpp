@@ -20,7 +20,7 @@ struct Influence
     float weight;
 };
 
-// A mesh of two points, (1, 0, 0) and (0, 0, 1), ten up, and two bones that stand elsewhere.
+// A mesh of two points, (1, 0, 0) and (0, 0, 1), moved up by 10, and two bones at other places.
 class Skin : public testing::Test
 {
 protected:
@@ -141,8 +141,8 @@ TEST_F(Skin, ASecondSkinStartsFromTheWorld)
     Attach<CBoneSkinControl>({{m_kA.Get(), 1}});
     Attach<CBoneSkinControl>({{m_kB.Get(), 1}});
     Update();
-    ExpectPoint(Point(0), {101, -10, 100}); // back to the model and on with the second bone
-    ExpectPoint(Point(1), {0, 20, 1});      // with the mesh twice
+    ExpectPoint(Point(0), {101, -10, 100}); // back to model space, then moved by the second bone
+    ExpectPoint(Point(1), {0, 20, 1});      // moved by the mesh twice
 }
 
 TEST_F(Skin, ByPointAPlaceIsTheSumOfItsBonesAndOthersCollapse)
@@ -209,7 +209,7 @@ TEST_F(Skin, CopiesFollowCopiedBonesAndRebindDropsTheOthers)
     CSkinBoneControl& byPoint = Attach<CSkinBoneControl>({{m_kB.Get(), 0.5f}, {outside.Get(), 0.5f}});
     m_kRoot->DetachChild(m_kB.Get());
     m_kRoot->AttachChild(new CNode);
-    m_kRoot->AttachChild(m_kB.Get()); // behind the mesh
+    m_kRoot->AttachChild(m_kB.Get()); // after the mesh
     CCloneMap map;
     const Ref<CNode> root = static_cast<CNode*>(m_kRoot->Clone(map));
     CSpatial* const copied = static_cast<CNode*>(root->FindObject("right", nullptr, false));
@@ -219,7 +219,7 @@ TEST_F(Skin, CopiesFollowCopiedBonesAndRebindDropsTheOthers)
     auto& pointCopy = static_cast<CSkinBoneControl&>(*mesh.GetControl()->GetNext());
     EXPECT_EQ(boneCopy.Bones()[0].m_pkBone.Get(), copied);
     EXPECT_EQ(boneCopy.Bones()[1].m_pkBone.Get(), outside.Get()) << "what was not cloned stays";
-    for (int time = 0; time < 2; ++time) // the second time changes nothing more
+    for (int time = 0; time < 2; ++time) // the second update must change nothing
     {
         root->Rebind(map);
         ASSERT_EQ(boneCopy.Bones().size(), 1u);

@@ -34,7 +34,7 @@ TEST(VertexTable, CornersShareAVertexExactlyWhenAllTheirIndicesAgree)
     EXPECT_TRUE(cube->VertexColorIndex().empty());
 }
 
-// The rule told as it stands: an ordered set of keys, and the rank of each corner's key in it.
+// Implements the rule literally: an ordered set of keys, and the rank of each corner's key in it.
 TEST(VertexTable, VerticesAreNumberedByTheOrderOfTheirSignedKeys)
 {
     const Ref<CTriMesh> mesh = FullMesh();
@@ -144,7 +144,7 @@ TEST(WorldNormals, AreWeightedByAreaAndZeroWhereOnlyFlatTrianglesMeet)
     mesh->SetPointCount(5);
     mesh->SetNormalCount(4);
     mesh->SetTriangleQuantity(3);
-    // Twice the area along z is 2, along x is 1; the third triangle is a line.
+    // Twice the area along z is 2, along x it is 1; the third triangle is degenerate.
     std::ranges::copy(std::vector<Vec3>{{0, 0, 0}, {2, 0, 0}, {0, 1, 0}, {0, 0, 1}, {1, 0, 0}},
                       mesh->XYZBuffer().begin());
     std::ranges::copy(std::vector<uint32_t>{0, 1, 2, 0, 2, 3, 0, 1, 4}, mesh->XYZTriIndexBuffer().begin());
@@ -157,7 +157,7 @@ TEST(WorldNormals, AreWeightedByAreaAndZeroWhereOnlyFlatTrianglesMeet)
     ExpectNormal(normals[2], kVec3UnitX);
     EXPECT_EQ(normals[3], kVec3Zero);
 
-    mesh->XYZTriIndexBuffer()[4] = 99; // a triangle that names no point adds nothing
+    mesh->XYZTriIndexBuffer()[4] = 99; // a triangle with an invalid point adds nothing
     mesh->UpdateScene(0.0f, false);
     ExpectNormal(normals[0], kVec3UnitZ);
     EXPECT_EQ(normals[2], kVec3Zero);
@@ -176,7 +176,7 @@ TEST(CGeometry, UpdateRebuildsTheWorldCopyInItsMemory)
     ExpectNormal(mesh->m_kBound.m_kCentre, {9, 1, 1});
     EXPECT_FLOAT_EQ(mesh->m_kBound.m_fRadius, std::sqrt(3.0f));
     for (size_t corner = 20; corner < 24; ++corner)
-        ExpectNormal(mesh->WorldNormalBuffer()[corner], kVec3UnitY); // the face along x, turned
+        ExpectNormal(mesh->WorldNormalBuffer()[corner], kVec3UnitY); // the face along x, rotated
     mesh->UpdateRange(0, 0.0f);
     EXPECT_EQ(mesh->WorldXYZBuffer()[1], kVec3UnitX) << "points stay in model space";
     EXPECT_FALSE(mesh->m_bWorldValid);

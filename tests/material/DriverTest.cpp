@@ -1,4 +1,5 @@
-// The table of drivers and BMP files: every depth, both directions, files and streams, and what is no BMP.
+// The table of drivers, and BMP files: every depth, both directions, files and streams, and files that are
+// not BMP.
 
 #include "CBMPPicture.h"
 #include "PicFileType.h"
@@ -16,7 +17,7 @@ namespace {
 
 using namespace std::string_view_literals;
 
-// A BMP file in the making. Rows are given as they stand in the file.
+// A BMP file under construction. Rows are given as stored in the file.
 struct MadeBMP
 {
     int32_t width = 0;
@@ -51,7 +52,7 @@ struct MadeBMP
     }
 };
 
-// Colours of the file: blue lowest.
+// Colors as stored: blue in the lowest byte.
 const std::vector<uint32_t> kTwoColors = {0x00112233, 0x00aabbcc};
 
 std::vector<uint32_t> Colors(size_t count)
@@ -75,14 +76,14 @@ std::string Text(const std::vector<PixelRGBA>& pixels)
     return text;
 }
 
-// One row of a picture as text, "none" where it cannot be read.
+// Returns a row of a picture as text, "none" if it cannot be read.
 std::string RowText(CPicture& picture, int y)
 {
     std::vector<PixelRGBA> pixels(static_cast<size_t>(picture.Box().width));
     return picture.ReadRowRGBA(y, 0, picture.Box().width, pixels.data()) ? Text(pixels) : "none";
 }
 
-// All rows, one a line.
+// Returns all rows, one per line.
 std::string RowsText(CPicture& picture)
 {
     std::string text;
@@ -104,7 +105,7 @@ protected:
     CTempFolder m_kFolder;
 };
 
-// Puts a file or a pipe in the place of the standard input for a while.
+// Temporarily replaces the standard input by a file or a pipe.
 class StandardInput
 {
 public:
@@ -120,7 +121,7 @@ public:
         dup2(m_iSaved, 0);
         close(m_iSaved);
         m_bPipe ? pclose(m_pkPipe) : std::fclose(m_pkPipe);
-        // What was read ahead belongs to the input that is gone.
+        // Discards data that was read ahead from the old input.
         EXPECT_NE(std::freopen("/dev/null", "rb", stdin), nullptr);
     }
 
@@ -186,7 +187,7 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAFileInItsOrder)
 
 TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
 {
-    // Rows asked for, and what comes, by the number that their pixels are made of; 0 where none comes.
+    // The requested rows and the results, by the number that their pixels are made of; 0 for no result.
     const std::tuple<const char*, int, bool, std::string_view, std::string_view> cases[] = {
         {"a file, bottom up", 3, false, "012", "321"},  {"a file, top down", -3, false, "012", "123"},
         {"a file, back again", -3, false, "20", "31"},  {"a pipe, top down", -3, true, "02", "13"},
@@ -261,7 +262,7 @@ TEST_F(DriverTest, BMPRefusesInItsOwnWords)
     expect("an older header", good.substr(0, 14) + '\x0c' + good.substr(15), "");
 }
 
-// Every beginning of a file and every byte of its head at its extremes: the sanitizers watch.
+// Tries every prefix of a file, and every byte of its header at its extremes, under the sanitizers.
 TEST_F(DriverTest, BMPSurvivesDamage)
 {
     testing::internal::CaptureStderr();

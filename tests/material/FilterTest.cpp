@@ -1,4 +1,4 @@
-// The table of filters: what its columns promise, the kernels must keep.
+// The table of filters: kernels must have the properties that its columns promise.
 
 #include "CFilter.h"
 
@@ -23,7 +23,7 @@ CFilter Named(std::string_view name, double first = 0.0, double second = 0.0)
     return filter;
 }
 
-// A copy of each filter, with parameters where it takes some.
+// Returns a copy of each filter, with parameters if it has any.
 std::vector<CFilter> ReadyFilters()
 {
     std::vector<CFilter> filters;
@@ -106,7 +106,7 @@ TEST(CFilter, HaveKnownValues)
         EXPECT_NEAR((*FindFilter(name))(x), value, 1e-10) << name << " " << x;
 }
 
-// Two corners of its family are other filters, so that all seven coefficients have something to agree with.
+// Two members of its family are other filters, so all seven coefficients can be compared.
 TEST(CFilter, MitchellHoldsCubicAndCatrom)
 {
     const CFilter cubic = Named("mitchell", 1.0, 0.0);

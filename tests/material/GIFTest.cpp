@@ -1,4 +1,4 @@
-// GIF files: known bytes, codes of every size from an encoder of the test's own, and damage.
+// GIF files: known bytes, codes of every size from the test's own encoder, and damage.
 
 #include "CGIFReader.h"
 #include "CLZWDecoder.h"
@@ -17,14 +17,14 @@ namespace {
 
 using Pixels = std::vector<uint8_t>;
 
-// How the encoder goes on when all codes are taken.
+// What the encoder does when all codes are in use.
 enum class EFull
 {
-    Clear, ///< it begins anew
-    Keep,  ///< it goes on with the codes that it has
+    Clear, ///< starts with a new table
+    Keep,  ///< continues with the existing codes
 };
 
-// Pixels as the bytes of LZW codes.
+// Encodes pixels with LZW.
 std::string Encoded(const Pixels& pixels, unsigned pixelBits, EFull full)
 {
     const unsigned clear = 1u << pixelBits;
@@ -65,7 +65,7 @@ std::string Encoded(const Pixels& pixels, unsigned pixelBits, EFull full)
         }
         else if (count < 4096)
         {
-            // The reader makes its entries one code later than the writer.
+            // The reader adds its entries one code later than the writer.
             if (count == 1u << width && width < 12)
                 ++width;
             codes[longer] = count++;
@@ -97,7 +97,7 @@ std::string Blocks(const std::string& bytes)
     return blocks + '\0';
 }
 
-// A palette whose entry i is (i, 2 i, 255 - i).
+// Returns a palette whose entry i is (i, 2 i, 255 - i).
 std::string Palette(unsigned bits)
 {
     std::string colors;
@@ -127,7 +127,7 @@ Pixels Random(size_t count, unsigned bits)
     return pixels;
 }
 
-// The first image of a file in memory, with a block of its own, so that nothing behind it can be read unseen.
+// Reads the first image of a file in its own buffer, so that reading past the end is noticed.
 bool ReadFirst(const std::string& file, GIFImage& image)
 {
     const std::vector<char> bytes(file.begin(), file.end());
@@ -141,7 +141,7 @@ size_t PixelCount(const GIFImage& image)
     return static_cast<size_t>(image.box.width) * static_cast<size_t>(image.box.height);
 }
 
-// A known file of 10 by 10 pixels in four colours.
+// A known file of 10 x 10 pixels in four colors.
 const std::string
     kKnown("GIF89a\x0a\0\x0a\0\x91\0\0\xff\xff\xff\xff\0\0\0\0\xff\0\0\0!\xf9\x04\0\0\0\0\0,\0\0\0\0\x0a\0"
            "\x0a\0\0\x02\x16\x8c-\x99\x87*\x1c\xdc"
@@ -255,7 +255,7 @@ TEST(CGIFReader, RefusesDamage)
     EXPECT_FALSE(reads(head + Image(2, 1, 0, 0, codes))) << "pixels of no bits";
     EXPECT_FALSE(reads(head + Image(2, 1, 0, 9, codes))) << "pixels of nine bits";
     EXPECT_FALSE(reads(head + Image(2, 2, 0, 2, codes))) << "fewer pixels than its size";
-    // Three bits a code: clear and a pixel, then a code that is not made yet; clear and what is no pixel.
+    // Three bits per code: clear, a pixel and an undefined code; then clear and a code that is not a pixel.
     EXPECT_FALSE(reads(head + Image(2, 1, 0, 2, std::string("\xdc\x01", 2)))) << "a code of later";
     EXPECT_FALSE(reads(head + Image(2, 1, 0, 2, std::string("\x34\0", 2))))
         << "a first code that is no pixel";

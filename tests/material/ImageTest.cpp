@@ -15,7 +15,7 @@ namespace gw {
 
 TEST(PictureFiles, FormatsKeepPixelsAndResolution)
 {
-    // resolution: 96 where the format keeps none
+    // resolution: 96 if the format does not store it
     const std::tuple<const char*, int32_t, int, int32_t> rows[] = {
         {"a.png", 0, 0, 300}, {"a.PNG", 1, 0, 300}, {"a.bmp", 0, 0, 300}, {"a.tga", 1, 0, 96},
         {"a.tif", 0, 0, 300}, {"a.gif", 0, 2, 96},  {"a.jpg", 1, 6, 300}, {"a.jpeg", 0, 6, 300},
@@ -53,7 +53,7 @@ TEST(PictureFiles, PrintColorsBecomeScreenColors)
 {
     using namespace std::string_literals;
     const CTempFolder folder;
-    // One pixel of magenta and yellow, each plane by itself; 255 is no ink.
+    // One pixel of magenta and yellow, one plane each; 255 means no ink.
     WriteBytes(folder.Path("red.psd"), "8BPS\0\1\0\0\0\0\0\0\0\4\0\0\0\1\0\0\0\1\0\x8\0\4"s +
                                            std::string(14, '\0') + "\xff\0\0\xff"s);
     const Ref<CImage> image = new CImage;
@@ -85,7 +85,7 @@ TEST(PictureFiles, WhatIsNoPictureLeavesAnEmptyImage)
     WriteBytes(folder.Path("drawing.svg"), "<svg xmlns='http://www.w3.org/2000/svg' width='9' height='9'/>");
     WriteBytes(folder.Path("drawing.mvg"), "push graphic-context viewbox 0 0 9 9 pop graphic-context");
     WriteBytes(folder.Path("name.txt"), "a.png");
-    // 60,000 x 60,000 pixels, of which there is not one.
+    // 60,000 x 60,000 pixels, none of which is in the file.
     WriteBytes(folder.Path("huge.pgm"), "P5 60000 60000 255\n");
     WriteBytes(folder.Path("cut.png"), png.substr(0, 30));
     const std::string names[] = {"empty.png", "text.png", "drawing.svg", "drawing.mvg", "name.txt",
@@ -106,7 +106,7 @@ TEST(PictureFiles, WhatIsNoPictureLeavesAnEmptyImage)
     EXPECT_EQ(ReadBytes(folder.Path("a.png")), png) << "a failed write leaves the old file";
 }
 
-// Every beginning of a picture is read as far as it goes or refused.
+// Every prefix of a picture is read as far as possible or refused.
 TEST(PictureFiles, CutPicturesDoNoHarm)
 {
     const CTempFolder folder;
@@ -209,7 +209,7 @@ TEST(EmbeddedJPEG, WhatCannotBeOneIsNotLost)
     EXPECT_EQ(SaveBytes(again), broken.Bytes());
 }
 
-// Two frames: a red one of 2 x 2 pixels shown for 70 hundredths, and a green pixel at 1, 0 for 5.
+// Two frames: a red one of 2 x 2 pixels shown for 70 hundredths, and a green pixel at (1, 0) shown for 5.
 TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
 {
     constexpr char kFilm[] = "GIF89a\2\0\2\0\x80\0\0\xff\0\0\0\xff\0"
@@ -246,7 +246,7 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
 
 namespace {
 
-// A picture of one pixel.
+// Returns a picture of one pixel.
 Ref<CImage> Dot(uint8_t shade)
 {
     Ref<CImage> image = new CImage;
@@ -261,7 +261,7 @@ TEST(CAnmImageControl, DrawsTheFrameOfItsTimeAtItsPlace)
 {
     const Ref<CAnmImage> film = new CAnmImage;
     film->AddFrame({0, 50, 0, 0, {}, Dot(10).Get()});
-    film->AddFrame({0, 7, 1, 0, {}, Dot(20).Get()}); // begins after its own delay: at 70
+    film->AddFrame({0, 7, 1, 0, {}, Dot(20).Get()}); // starts after its own delay: at 70
     film->AddFrame({0, 2, 2, 0, {}, nullptr});       // at 90, and shows nothing
     const Ref<CImage> screen = new CImage;
     const uint8_t black[4] = {0, 0, 0, 255};

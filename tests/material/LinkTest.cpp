@@ -17,7 +17,7 @@ namespace {
 
 constexpr std::string_view kNote = "ImageLoadFailed.txt";
 
-// A container of images that link files, by their names.
+// Returns a container of images that link these files.
 std::string LinkingScene(std::initializer_list<std::string_view> names, std::string_view className = "CImage")
 {
     CSceneBytes bytes;
@@ -42,7 +42,7 @@ protected:
         Halves()->Save(m_kFolder.Path("below/deep/other.png"), 90);
     }
 
-    // Loads a container in the folder that links these.
+    // Loads a container in the folder that links these files.
     bool Load(COrrinStream& stream, std::initializer_list<std::string_view> names,
               std::string_view className = "CImage")
     {
@@ -64,7 +64,7 @@ TEST(LinkNames, LeadWhereTheRuleSays)
     const CTempFolder folder;
     const std::string there = folder.Path("there.png");
     WriteBytes(there, "x");
-    // path: below the folder /scenes, or from the root
+    // path: below the folder /scenes, or absolute
     const std::tuple<std::string, const char*> rows[] = {
         {"a.png", "a.png"},
         {"textures\\a.png", "a.png"},
@@ -214,7 +214,7 @@ TEST_F(LinkedImage, KeepsWhatItHoldsWhenAnotherContainerMeetsIt)
     CImage& image = ImageAt(first, 0);
     ASSERT_NE(image.GetCustomData(), nullptr);
 
-    CSceneBytes ring; // two nodes that hold each other are refused and fall apart
+    CSceneBytes ring; // two nodes that hold each other are refused and deleted
     ring.Header().EmptyThumbnail().Root().Node(1, {2}).Node(2, {1});
     ring.Root().Object("CImage", 3, "second", {0, 0, 0}).Text("halves.png").Add<uint16_t>(0);
     WriteBytes(m_kFolder.Path("ring.orn"), ring.View());

@@ -126,9 +126,10 @@ TEST(MaterialFile, DamageStaysInside)
 TEST(MaterialFile, LinksOfAnotherClassAreNullAndAbstractClassesEndTheReading)
 {
     CSceneBytes bytes = Scene().Root();
-    AddStandardMaterial(bytes, 1, {1, 2, 3, 9, 0, 0, 0, 0, 0, 0, 0, 0}); // a material is no texture
-    bytes.Object("CTextureMap", 2).Byte(0).Words({0, 2});                // a texture is no image
-    bytes.Object("CBlendMaterial", 3).Byte(0).Float(0).Words({2, 2, 1}); // a texture may be a material
+    AddStandardMaterial(bytes, 1, {1, 2, 3, 9, 0, 0, 0, 0, 0, 0, 0, 0}); // a material is not a texture
+    bytes.Object("CTextureMap", 2).Byte(0).Words({0, 2});                // a texture is not an image
+    // a texture can be used as a material
+    bytes.Object("CBlendMaterial", 3).Byte(0).Float(0).Words({2, 2, 1});
     bytes.Root().Object("CBlendMaterial", 4).Byte(0).Float(0).Words({2, 9, 1});
     COrrinStream stream;
     ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));

@@ -13,7 +13,7 @@
 
 namespace gw {
 
-/// An image that is stored plainly, with every pixel of its own.
+/// Returns an image stored as plain pixels, all different.
 inline Ref<CImage> PlainImage(const char* name, int32_t format = 0,
                               EPixelStorage storage = EPixelStorage::Heap)
 {
@@ -32,7 +32,7 @@ inline Ref<CImage> PlainImage(const char* name, int32_t format = 0,
     return image;
 }
 
-/// A texture with an image of the same name.
+/// Returns a texture with an image of the same name.
 inline Ref<CTextureMap> MapOf(CImage* image)
 {
     Ref<CTextureMap> map = new CTextureMap;
@@ -61,8 +61,8 @@ inline Ref<CStandardMaterial> FullMaterial()
     return material;
 }
 
-/// A graph with each kind of material and texture, no value at its default, images that are shared and in
-/// both kinds of storage, and a material that is blended with itself.
+/// Returns a graph with each kind of material and texture, no default values, shared images in both kinds of
+/// storage, and a material blended with itself.
 inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::TempStore)
 {
     const Ref<CImage> wood = PlainImage("wood");
@@ -86,7 +86,7 @@ inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::
     return multi.Get();
 }
 
-/// A picture of 16 x 8 pixels that is blue on the left and orange on the right, which JPEG keeps well.
+/// Draws a picture of 16 x 8 pixels, blue on the left and orange on the right, which JPEG preserves well.
 inline void DrawHalves(CPixelBuffer& pixels, int32_t format = 0)
 {
     const uint8_t blue[4] = {250, 20, 10, 255};

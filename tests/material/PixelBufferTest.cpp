@@ -31,8 +31,8 @@ class EveryStorage : public testing::TestWithParam<EPixelStorage>
 
 TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
 {
-    // stride: 0 for refused
-    // block: 0 for refused
+    // stride: 0 if refused
+    // block: 0 if refused
     const std::tuple<int32_t, int32_t, int32_t, bool, size_t, size_t> rows[] = {
         {5, 1, 0, false, 20, 20},       {5, 1, 1, false, 15, 16}, {5, 1, 1, true, 16, 17},
         {5, 3, 2, false, 10, 32},       {5, 3, 3, true, 12, 38},  {5, 3, 4, false, 10, 32},
@@ -55,7 +55,7 @@ TEST(CPixelBuffer, BlocksHaveTheSizeThatTheFormatSays)
 
 TEST_P(EveryStorage, CreateFillsClearsAndRefusesAsStated)
 {
-    CPixelBuffer other; // keeps the temporary file, so that blocks are used again
+    CPixelBuffer other; // keeps the temporary file, so that blocks are reused
     ASSERT_TRUE(other.SetStorage(EPixelStorage::TempStore) && other.Create(1, 1, 0));
     std::array<uint8_t, 64> block;
     block.fill(9);
@@ -172,7 +172,7 @@ TEST(Blit, MixesByOpacityInAllPairings)
 
 TEST(Blit, IsCutToBothPictures)
 {
-    // A source of 3 x 3 pixels numbered from 1 on, on a destination of 4 x 3 zeros.
+    // A source of 3 x 3 pixels numbered from 1, on a destination of 4 x 3 zeros.
     const struct
     {
         const char* what;

@@ -28,7 +28,7 @@ protected:
     CTempStore m_kStore{m_kFolder.Path("TKTmp/")};
 };
 
-// Files of this process cannot grow beyond a size while this lives, as on a full disk.
+// Limits the size of files in this process, like a full disk.
 class CFullDisk
 {
 public:
@@ -94,7 +94,7 @@ TEST_F(TempStore, ABlockKeepsItsBytesWhileNobodyLooks)
         EXPECT_EQ(m_kStore.Map(handle), bytes) << "a second use sees the same view";
         std::memset(bytes, static_cast<int>(handle >> 16 ^ handle), size);
         m_kStore.Unmap(handle);
-        bytes[size - 1] = std::byte{77}; // the first use still holds
+        bytes[size - 1] = std::byte{77}; // the first mapping is still valid
         m_kStore.Unmap(handle);
     }
     for (const auto& [handle, size] : {std::pair{small, 3 * kPage}, {other, kPage}, {large, kFile + 5}})
@@ -148,7 +148,7 @@ TEST_F(TempStore, TheLimitCountsWholeFiles)
     EXPECT_NE(m_kStore.Allocate(kPage), 0u);
 }
 
-// A touch of what is not there would be a signal.
+// Touching unreserved space would raise a signal.
 TEST_F(TempStore, SpaceIsReservedBeforeItIsTouched)
 {
     m_kStore.Allocate(10 * kPage);
@@ -207,7 +207,7 @@ TEST_F(TempStore, APurgeTakesWhatACrashLeft)
     EXPECT_FALSE(FolderExists(m_kFolder.Path("old")));
 }
 
-// Everybody may make a link in the folder for temporary files.
+// Anybody can create a link in the folder for temporary files.
 TEST_F(TempStore, ALinkToAFolderOfSomebodyIsLeftAlone)
 {
     CreateFolder(m_kFolder.Path("home"));

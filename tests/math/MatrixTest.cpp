@@ -81,7 +81,7 @@ TEST(Mat4, ComposeScalesThenTurnsThenMoves)
     ExpectNear(Mat4Compose(NormalizedRows(m), kVec3Zero), Mat4Compose(quarter, kVec3Zero));
     Mat4Compose(m, nullptr, nullptr, nullptr);
     EXPECT_EQ(m, kMat4Identity);
-    EXPECT_EQ(NormalizedRows(kMat4Zero), Mat3{}); // a row of length 0 stays, and is no NaN
+    EXPECT_EQ(NormalizedRows(kMat4Zero), Mat3{}); // a row of length 0 is kept, without NaN
 }
 
 TEST(Mat4, ProductsActFromLeftToRightAndMayBeTheirOperands)
@@ -111,7 +111,7 @@ TEST(Mat4, TheInverseIsGeneralAndLeavesItsOutputWhereItFails)
     ExpectNear(inverse * kSkewed, kMat4Identity);
     EXPECT_NE(determinant, 0.0f);
 
-    Mat4 tiny = kMat4Identity; // whose determinant is no 0, but has no reciprocal in 32 bits
+    Mat4 tiny = kMat4Identity; // its determinant is not 0, but has no finite reciprocal in 32 bits
     tiny.m[0] = 1e-20f;
     tiny.m[5] = 1e-20f;
     for (const Mat4& singular : {kMat4Zero, tiny})

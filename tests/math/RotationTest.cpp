@@ -27,7 +27,7 @@ Mat3 About(char axis, float degrees)
     return Mat3FromAxisAngle(unit, degrees * kDegreesToRadians);
 }
 
-// A row vector after quarter turns about an axis: each takes the next axis to the one after it.
+// Rotates a row vector by quarter turns about an axis: each takes the next axis to the one after it.
 std::array<int, 3> QuarterTurns(std::array<int, 3> v, int axis, int count)
 {
     const auto b = static_cast<size_t>((axis + 1) % 3);
@@ -87,10 +87,11 @@ TEST(Euler, AnglesComeBackInAllOrders)
                    0.0);
 }
 
-// Codes 0 to 3 answer a quarter turn of the middle angle with the opposite sign, codes 4 and 5 with its own.
+// For a quarter turn of the middle angle, codes 0 to 3 return it with the opposite sign, codes 4 and 5 with
+// its own.
 TEST(Euler, QuarterTurnsOfTheMiddleAngle)
 {
-    // axes: of the two turns from left to right
+    // axes: of the two rotations from left to right
     const std::tuple<const char*, const char*, int, float, float, Vec3> rows[] = {
         {"XYZ up", "YX", 0, 90.0f, 30.0f, {-30.0f, -90.0f, 0.0f}},
         {"XYZ down", "YX", 0, -90.0f, 30.0f, {-30.0f, 90.0f, 0.0f}},
@@ -111,7 +112,7 @@ TEST(Euler, QuarterTurnsOfTheMiddleAngle)
         const Mat3 m = About(axes[0], first) * About(axes[1], second);
         ExpectNear(ToEulerDegrees(m, order), degrees, 1e-3);
     }
-    // A quarter turn of the angle from which X is derived, to the last bit.
+    // A quarter turn of the angle from which X is derived, exact to the last bit.
     const Mat3 quarter = Mat3FromAxisAngle(kVec3UnitZ, kHalfPi);
     ExpectNear(ToEulerDegrees(About('Y', 30.0f) * About('X', 20.0f) * quarter, 4), {20.0f, 30.0f, 90.0f},
                1e-3);
@@ -134,7 +135,7 @@ TEST(Euler, DegreesRebuildAWholeTurnAndAreNeverNaN)
                   Mat3ToEulerDegrees(NormalizedRows(scaled)));
     }
     ExpectNear(Mat3ToEulerDegrees(About('X', -100.0f)), {260.0f, 0.0f, 0.0f}, 1e-3);
-    const Mat3 upright{{0, 0, -1, 0, 1, 0, 1, 0, 0}}; // a quotient of 0 by 0, and the sine at its end
+    const Mat3 upright{{0, 0, -1, 0, 1, 0, 1, 0, 0}}; // a quotient of 0 by 0, with the sine at its end
     ExpectNear(Mat3ToEulerDegrees(upright), {0.0f, -90.0f, 0.0f}, 1e-3);
 }
 
@@ -156,7 +157,7 @@ TEST(Angles, TheEndsOfTheArcSineAreTheOtherWayRound)
         EXPECT_EQ(SafeAcos(-x), kPi64);
     }
     EXPECT_GT(SafeAsin(std::nextafter(1.0f, 0.0f)), 1.57);
-    EXPECT_EQ(kHalfPi, static_cast<float>(kHalfPi64)); // what the gimbal test compares
+    EXPECT_EQ(kHalfPi, static_cast<float>(kHalfPi64)); // the value used by the gimbal test
     EXPECT_EQ(kDegreesToRadians, static_cast<float>(kPi64 / 180.0));
 }
 
@@ -164,7 +165,7 @@ TEST(Quat, MatricesComeBackAlsoFromHalfTurns)
 {
     const float r = std::sqrt(0.5f);
     const float s = std::sqrt(1.0f / 3.0f);
-    // Of the last one only the largest element gives all digits.
+    // For the last one, only the largest element yields all digits.
     const Vec3 axes[] = {
         {1.0f, 0.0f, 0.0f}, {0.0f, 1.0f, 0.0f}, {0.0f, 0.0f, 1.0f}, {r, r, 0.0f},
         {0.0f, -r, r},      {r, 0.0f, -r},      {s, s, -s},         {0.0f, 0.9999995f, 0.001f},
@@ -203,7 +204,8 @@ TEST(Quat, SlerpGoesTheShortWayAtAnEvenPace)
         Quat minusA;
         QuatScale(a, -1.0f, minusA);
         const Quat same = QuatSlerp(t, a, minusA);
-        EXPECT_LT(std::fabs(same.w - a.w) + std::fabs(same.y - a.y), 1e-6f) << t; // and not its negative
+        // the quaternion itself, not its negative
+        EXPECT_LT(std::fabs(same.w - a.w) + std::fabs(same.y - a.y), 1e-6f) << t;
     }
     Quat out = a;
     QuatSlerp(out, 0.5f, out, b);

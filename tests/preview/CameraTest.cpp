@@ -1,4 +1,4 @@
-// Where the camera stands for a scene, and what dragging does to it.
+// The camera's position for a scene, and the effect of dragging.
 
 #include "PreviewScene.h"
 
@@ -38,7 +38,7 @@ TEST(Camera, LooksAtTheMiddleOfAScene)
     standsAt({5, 6, 7}, {5, 6, 12});
 }
 
-// The scene is as large as makes one pixel of the mouse one unit. Drags begin at (100, 100).
+// The scene's size makes one pixel of the mouse one unit. Drags begin at (100, 100).
 TEST(Mouse, DraggingMovesTheCamera)
 {
     struct Move

@@ -1,4 +1,4 @@
-// The playback clock: where it stands after each operation, what it evaluates and which scene it keeps.
+// The playback clock: its time after each operation, the updates it causes, and the scene it keeps.
 
 #include "PreviewScene.h"
 
@@ -14,7 +14,7 @@ constexpr float kLastFrame = 4.0f; // so that the end is at 2
 using View = CGLView;
 using Operations = std::vector<void (View::*)()>;
 
-// All operations of the clock that may move something.
+// Performs all operations of the clock that can move something.
 void OperateAll(View& view)
 {
     view.Play();
@@ -42,7 +42,7 @@ void ExpectStand(int eighth, const Operations& operations, float time, bool play
     EXPECT_EQ(view.m_iRepaints, 1 + static_cast<int>(keeper.m_kTimes.size()));
 }
 
-// From an eighth of the motion on, which is half a frame.
+// Starts at an eighth of the motion, which is half a frame.
 TEST(Clock, StandsWhereEachOperationLeavesIt)
 {
     const std::tuple<const char*, int, Operations, float, bool> rows[] = {

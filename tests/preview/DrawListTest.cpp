@@ -1,4 +1,4 @@
-// The lines that a scene is drawn as.
+// The lines drawn for a scene.
 
 #include "PreviewScene.h"
 
@@ -10,7 +10,7 @@ namespace {
 
 constexpr size_t kAxisEnds = 6;
 
-// The lines of a scene without any evaluation.
+// Returns the lines of a scene without updating it.
 std::vector<LineEnd> LinesOf(CNode& scene, const char* highlight = "")
 {
     CGLView view;
@@ -61,7 +61,7 @@ TEST(DrawList, TriangleIsAClosedOutlineInTheWorld)
         ExpectLine(lines, kAxisEnds + 2 * side, corners[side], corners[(side + 1) % 3], kBoneColor);
 }
 
-// The mesh is turned by a quarter about Z and scaled.
+// The mesh is rotated by a quarter turn about Z and scaled.
 TEST(DrawList, AxesFollowTheMeshWithItsScale)
 {
     const Ref<CNode> scene = MakeScene({kVec3Zero, 50});
@@ -115,7 +115,7 @@ TEST(DrawList, FollowsATreeThatChangesUnderIt)
     EXPECT_EQ(meshes(), 1u);
     CSpatial* const second = AttachBone(*scene, "second", 1).GetParent();
     EXPECT_EQ(meshes(), 2u);
-    scene->DetachChild(second); // its end
+    scene->DetachChild(second); // deletes it
     EXPECT_EQ(meshes(), 1u);
 
     auto& first = static_cast<CNode&>(*scene->ChildAt(0));

@@ -1,4 +1,4 @@
-// Pixels, drawn without a display. Where the machine's GL can make no context for that, the tests return.
+// Pixels drawn without a display. If the machine's GL cannot create such a context, the tests return.
 
 #include "COffscreenContext.h"
 #include "GLPainter.h"
@@ -15,7 +15,7 @@ namespace {
 
 constexpr int kSide = 200;
 constexpr LineColor kClearColor{51, 51, 51};
-constexpr BoundSphere kBound{kVec3Zero, 40}; // the eye is 100 away: about 2.4 pixels a unit
+constexpr BoundSphere kBound{kVec3Zero, 40}; // the eye is 100 away: about 2.4 pixels per unit
 
 class PictureTest : public testing::Test
 {
@@ -53,7 +53,7 @@ TEST_F(PictureTest, NothingIsTheClearColour)
     EXPECT_EQ(CountColor(Draw(MakeScene(kBound).Get()), kClearColor), kSide * kSide);
 }
 
-// The world is turned so that one axis after another points up: 4 units, which are 9 to 10 pixels.
+// The world is rotated so that each axis in turn points up: 4 units, which are 9 to 10 pixels.
 TEST_F(PictureTest, AxesAreRedGreenAndBlue)
 {
     if (!m_bCanDraw)
@@ -154,7 +154,7 @@ TEST_F(PictureTest, NoSizeKeepsTheOldProjection)
     EXPECT_EQ(Draw(scene.Get()).rgb, before.rgb);
 }
 
-// What one call for all lines must look like: a loop of its own for each triangle.
+// Draws a separate loop for each triangle, which a single call for all lines must match.
 void DrawByLoops(std::span<const LineEnd> ends)
 {
     for (size_t i = 0; i < ends.size();)

@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// The part of a picture from the first two on and before the last two.
+/// Part of a picture, between the first two and the last two numbers.
 struct PixelArea
 {
     int left;
@@ -19,7 +19,7 @@ inline PixelArea WholeOf(const RgbPicture& picture)
     return {0, 0, picture.width, picture.height};
 }
 
-/// How many pixels of an area have exactly a colour.
+/// Returns the number of pixels in an area with exactly this color.
 inline int CountColor(const RgbPicture& picture, LineColor color, const PixelArea& area)
 {
     int count = 0;

@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// A control that changes nothing and notes the times at which its target was evaluated.
+/// A control that changes nothing and records the times of its target's updates.
 class CTimeKeeper : public CControl
 {
 public:
@@ -22,15 +22,15 @@ public:
     std::vector<float> m_kTimes;
 };
 
-/// A root with a bound of its own, which lasts until the scene is evaluated.
+/// Returns a root with a given bound, which lasts until the scene is updated.
 Ref<CNode> MakeScene(const BoundSphere& bound);
-/// Attaches a keeper to a scene; the scene owns it.
+/// Attaches a recorder to a scene, which owns it.
 CTimeKeeper& AttachKeeper(CNode& root);
-/// Attaches a named bone to a node, at a place in it, and a mesh to the bone. The mesh has separate
-/// triangles, the i-th one moved by i along Z.
+/// Attaches a named bone to a node, at a position, and a mesh to the bone. The mesh has separate triangles,
+/// the i-th one moved by i along Z.
 CTriMesh& AttachBone(CNode& parent, const char* name, int32_t triangles, const Vec3& place = kVec3Zero);
 
-/// A view that counts how often it asks to be drawn.
+/// A view that counts its repaint requests.
 class CCountedView : public CGLView
 {
 public:

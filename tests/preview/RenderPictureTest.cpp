@@ -1,4 +1,4 @@
-// Whole pictures: their parts, what they show and how they are written.
+// Whole pictures: their layout, their contents and their files.
 
 #include "RenderPicture.h"
 #include "Pixels.h"
@@ -12,7 +12,7 @@ namespace {
 
 using Times = std::vector<float>;
 
-// The times of the poses that were drawn, which are the last that were evaluated.
+// Returns the times of the drawn poses, which are the last updates.
 Times DrawnTimes(const CTimeKeeper& keeper, int poses)
 {
     const Times& all = keeper.m_kTimes;
@@ -56,7 +56,7 @@ TEST(RenderPicture, ShowsAllMotionsAtTheSameShare)
     }
 }
 
-// A motion that shows one triangle.
+// Returns a motion that shows one triangle.
 PictureMotion TriangleMotion(const char* boneName, const Vec3& place)
 {
     const Ref<CNode> scene = MakeScene({});
@@ -64,7 +64,7 @@ PictureMotion TriangleMotion(const char* boneName, const Vec3& place)
     return {scene, 1.0f, 4.0f};
 }
 
-// Of the source and the result, which have colours of their own; nothing where no picture can be drawn.
+// Draws source and result in different colors; empty if no picture can be drawn.
 RgbPicture TwoMotions(int poseCount)
 {
     PictureOptions options;

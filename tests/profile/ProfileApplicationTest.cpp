@@ -1,4 +1,4 @@
-// Where a profile meets two skeletons: look-ups by name, the retargeter's tables, and how well a file fits.
+// A profile applied to two skeletons: look-ups by name, the retargeter's tables, and how well a file fits.
 #include "ProfileFixture.h"
 
 #include "CRetargeter.h"

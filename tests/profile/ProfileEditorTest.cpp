@@ -1,4 +1,4 @@
-// The editor's model: what the user's fields, clicks and selections do.
+// The editor's model: the effect of fields, clicks and selections.
 #include "ProfileFixture.h"
 
 #include <gmock/gmock.h>

@@ -1,4 +1,4 @@
-// The profile file as text: what its lines say, and what the reader makes of lines that say too little.
+// The text of a profile file: the meaning of its lines, and the handling of incomplete ones.
 #include "CProfileTexts.h"
 #include "ProfileFixture.h"
 
@@ -10,7 +10,8 @@
 namespace gw {
 namespace {
 
-// A line as "12 source>target 1,2,3 4,5,6", "12 rate 30" or "12 at 1,2,3", with its number in the file.
+// Returns a line as "12 source>target 1,2,3 4,5,6", "12 rate 30" or "12 at 1,2,3", starting with its line
+// number.
 std::string Describe(const ProfileLine& line)
 {
     const auto three = [](auto a, auto b, auto c) {
@@ -26,7 +27,7 @@ std::string Describe(const ProfileLine& line)
            ' ' + three(axes[0], axes[1], axes[2]);
 }
 
-// All lines behind the name, with "; " behind each.
+// Returns all lines after the name, each followed by "; ".
 std::string ReadAll(std::string_view text)
 {
     CProfileReader reader(text);
@@ -48,7 +49,7 @@ TEST(CProfileTexts, ThePackStandsForFilesThatAreAsTheyWere)
     {
         const char* what;
         std::string pack, a;
-        std::chrono::seconds age; // of A.prf, at the pack's time
+        std::chrono::seconds age; // of A.prf, relative to the pack's time
         const char* names;
     } rows[] = {
         {"as packed", pack, "edited A", 10s, "packed A|packed B|"},
@@ -114,7 +115,7 @@ TEST(ProfileReader, LinesSayWhatTheirFormSays)
 
 TEST(ProfileReader, BuffersCutLinesAndTokens)
 {
-    const std::string upTo1024(1017, ' '); // what "A x B 1" lacks
+    const std::string upTo1024(1017, ' '); // the rest after "A x B 1"
     const std::string b300(300, 'B');
     EXPECT_EQ(ReadAll("N\nA x B 1" + upTo1024 + "\n"), "2 A>B 1,0,0 1,2,3; ") << "not a blank line more";
     EXPECT_EQ(ReadAll("N\nA x B 1" + upTo1024 + "C x D 2\n"), "2 A>B 1,0,0 1,2,3; 2 C>D 2,0,0 1,2,3; ");
@@ -149,7 +150,7 @@ TEST(ProfileReader, EveryPrefixAndRubbishIsReadToItsEnd)
     for (size_t size = 0; size <= whole.size(); ++size)
     {
         const std::vector<char> cut(whole.begin(),
-                                    whole.begin() + std::ptrdiff_t(size)); // a block of its own
+                                    whole.begin() + std::ptrdiff_t(size)); // its own buffer
         EXPECT_LE(ReadAll({cut.data(), cut.size()}).size(), 200u);
     }
     std::mt19937 random(7);

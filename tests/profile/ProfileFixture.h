@@ -12,8 +12,8 @@
 
 namespace gw {
 
-/// A program around the editor that answers from a script and records what it was asked. Its two profile
-/// folders lie in one temporary folder.
+/// A scripted owner for the editor that records requests. Its two profile folders are in one temporary
+/// folder.
 class CScriptedOwner : public CProfileOwner
 {
 public:
@@ -25,12 +25,12 @@ public:
     std::string ExeFile(const std::string& name) override { return m_kFolder.Path(name); }
     bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
 
-    /// The messages shown since the last call, as "157 OK -10000 10000".
+    /// Returns the messages since the last call, as "157 OK -10000 10000".
     std::vector<std::string> TakeMessages() { return std::exchange(m_kMessages, {}); }
 
     CTempFolder m_kFolder;
     EAnswer m_eAnswer = EAnswer::OK;
-    std::function<bool(CBoneOffsetDialog&)> boneOffset; ///< what the user does in the offset dialog
+    std::function<bool(CBoneOffsetDialog&)> boneOffset; ///< user actions in the offset dialog
     int m_iStateChanges = 0;
     int m_iSetChanges = 0;
 
@@ -38,28 +38,28 @@ private:
     std::vector<std::string> m_kMessages;
 };
 
-/// A chain of bones, each the parent of the next.
+/// Returns a chain of bones, each the parent of the next.
 Ref<CNode> MakeChain(const std::vector<std::string>& names);
 
-/// A row as "source|target|rx|ry|rz|x|y|z".
+/// Returns a row as "source|target|rx|ry|rz|x|y|z".
 std::string RowText(const CMapRowTable& rows, int row);
 std::vector<std::string> RowTexts(const CMapRowTable& rows);
 
-/// An editor in a program, with a source of bones A, B, C and a target of LowerTorso, Waist, Head and the
-/// pelvis bones.
+/// An editor with a scripted owner, a source with bones A, B, C and a target with LowerTorso, Waist, Head and
+/// the pelvis bones.
 class ProfileEditor : public testing::Test
 {
 protected:
     ProfileEditor();
-    /// Writes a profile file and answers its path.
+    /// Writes a profile file and returns its path.
     std::string MakeProfile(const std::string& text, const std::string& name = "Test.prf");
-    /// Writes and loads one.
+    /// Writes and loads a profile.
     bool Load(const std::string& text) { return m_kEditor.LoadProfile(MakeProfile(text)); }
     void MakeReadOnly(const std::string& path);
     void SelectBones(const std::string& source, const std::string& target);
-    /// Counts the matches of a file, as "1 of 2, fits" or "1 of 2, misfit".
+    /// Returns the matches of a file, as "1 of 2, fits" or "1 of 2, misfit".
     std::string Count(const std::string& path);
-    /// Applies the profile without a retargeter, as "3 of 4, fits" or "3 of 4, misfit".
+    /// Applies the profile without a retargeter; returns "3 of 4, fits" or "3 of 4, misfit".
     std::string Apply();
     std::string Name() const;
 

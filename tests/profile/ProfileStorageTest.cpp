@@ -1,4 +1,4 @@
-// The editor's model: what loading, counting and saving do to rows, names and files.
+// The editor's model: the effect of loading, counting and saving on rows, names and files.
 #include "ProfileFixture.h"
 
 #include "ProfileNames.h"
@@ -165,7 +165,7 @@ TEST_F(ProfileEditor, LoadingAsksToSaveWhatWasChanged)
 
 TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
 {
-    // inUse: between bars
+    // inUse: separated by bars
     const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
         {"plain", "P", "P", "P(1)"},
         {"numbered", "P(1)", "x|P(1)", "P(2)"},
@@ -197,7 +197,7 @@ TEST_F(ProfileEditor, ChangeOfAReadOnlyProfileTakesANewName)
 
 TEST_F(ProfileEditor, NumberedNameStaysWithinTheLimitAndCanBeSaved)
 {
-    const std::string longName(kProfileNameLimit + 6, 'n'); // more than the field takes
+    const std::string longName(kProfileNameLimit + 6, 'n'); // longer than the field allows
     m_kNamesInUse = {longName};
     const std::string path = MakeProfile(longName + "\nA x Head 0\n");
     MakeReadOnly(path);

@@ -1,4 +1,4 @@
-// Undo and redo in the editor's model: what the user sees after going back and forth.
+// Undo and redo in the editor's model: the visible state after going back and forth.
 #include "ProfileFixture.h"
 
 #include <gmock/gmock.h>
@@ -34,7 +34,7 @@ protected:
         SelectBones(source, target);
         m_kEditor.ClickButton(kAddToMapButton);
     }
-    /// Name, rate, rows and whether they need saving: "N 30 A-Waist B-Head *".
+    /// Returns name, rate, rows and unsaved mark: "N 30 A-Waist B-Head *".
     std::string Seen() const
     {
         std::string text = Name() + ' ' + std::to_string(m_kEditor.GetFrameRate());
@@ -46,7 +46,7 @@ protected:
         }
         return text + (m_kEditor.IsDirty() ? " *" : "");
     }
-    /// The mapped bones of both trees, as "A B | Waist".
+    /// Returns the mapped bones of both trees, as "A B | Waist".
     std::string Marked() const
     {
         const auto marked = [](const CBoneTree& tree) {
@@ -136,7 +136,7 @@ TEST_F(ProfileUndo, CommandsWithoutAChangeAreNoSteps)
     Rename("  ");
     m_kEditor.SelectOnlyRow(0);
     m_kEditor.ClickRow(0);
-    m_kEditor.ClickButton(kBoneOffsetButton); // cancelled
+    m_kEditor.ClickButton(kBoneOffsetButton); // canceled
     m_kEditor.Undo();
     EXPECT_EQ(Seen(), "N 30 A-Waist");
 }

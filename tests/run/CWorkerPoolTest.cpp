@@ -19,14 +19,14 @@ using EKind = JobEnd::EKind;
 enum class EDeed
 {
     Good,
-    Bad, ///< the run ends with it, if it ends with any
+    Bad, ///< ends the run, if anything does
     Crash,
-    Exit, ///< as a sanitizer ends a program
+    Exit, ///< exits like a program that a sanitizer ends
     Hang,
-    Interrupt, ///< the program that started it
+    Interrupt, ///< interrupts the program that started it
 };
 
-// Each job writes a file of its number, and does what it is told.
+// Each job writes a file with its number and then acts as configured.
 class CDeeds : public CJobHandler
 {
 public:
@@ -42,7 +42,7 @@ public:
         std::fprintf(record, "record %zu by %d\n", job, getpid());
         std::fflush(nullptr);
         if (job % 3 == 0)
-            usleep(20'000); // the first of each three is behind the others
+            usleep(20'000); // the first of every three finishes after the others
         Do(m_kDeeds[job]);
         CSafeFile file;
         const bool written =

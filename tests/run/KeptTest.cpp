@@ -1,4 +1,4 @@
-// What a run keeps for the next one, and what it shows of itself.
+// A run's state for the next run, and its visible progress.
 
 #include "CContentHash.h"
 #include "CProgressBar.h"
@@ -66,7 +66,7 @@ TEST(CReportFile, HalfALineOfADeadWriterIsClosedFirst)
         CReportFile report;
         ASSERT_TRUE(report.Open(folder.Path("report"), start));
         EXPECT_TRUE(report.AddLine("new"));
-        EXPECT_EQ(ReadText(folder.Path("report")), after); // at once, and not when it is closed
+        EXPECT_EQ(ReadText(folder.Path("report")), after); // immediately, not when it is closed
     }
     CReportFile full;
     EXPECT_FALSE(full.Open("/dev/full", CReportFile::EStart::Empty) && full.AddLine("lost"));

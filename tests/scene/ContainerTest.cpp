@@ -88,7 +88,7 @@ TEST(PackageMotion, EveryByteIsWhereItBelongs)
 TEST(CPackageFile, PiecesMakeThePackageOfTheWholeMotion)
 {
     const CTempFolder folder;
-    const std::string motion(100'000, 'm'); // more than is gathered before it goes out
+    const std::string motion(100'000, 'm'); // more than the write buffer
     WriteBytes(folder.Path("a.htr"), motion);
     CFailureRecord record;
     ASSERT_TRUE(PackageMotion(folder.Path("a.htr"), folder.Path("whole"), 30.0f, 60.0f, record));
@@ -145,7 +145,7 @@ TEST(PackageMotion, ASourceThatIsNotThereIsRefusedAndATargetThatCannotBeIsTold)
 
 TEST(COrrinStream, HeadersAreRefusedByTheirRules)
 {
-    // text: 20 characters and what follows
+    // text: 20 characters, followed by more bytes
     const std::tuple<const char*, EFailure> rows[] = {
         {"TKOrrin Version 1.20", EFailure::None},       {"TKOrrin Version 0.01", EFailure::None},
         {"TKOrrin Version 1. 2", EFailure::None},       {"TKOrrin Version 1.1x", EFailure::None},
@@ -161,7 +161,7 @@ TEST(COrrinStream, HeadersAreRefusedByTheirRules)
         bytes.Raw(text).Byte(0).EmptyThumbnail();
         WriteBytes(folder.Path("a.orn"), bytes.View());
         COrrinStream stream;
-        stream.AddRoot(new CNode); // stays when the file is refused
+        stream.AddRoot(new CNode); // stays if the file is refused
         EXPECT_EQ(stream.LoadFile(folder.Path("a.orn"), false), reason == EFailure::None);
         EXPECT_EQ(stream.Record().Failure().reason, reason);
         EXPECT_EQ(stream.GetRootCount(), reason == EFailure::None ? 0u : 1u);
@@ -226,7 +226,7 @@ TEST(COrrinStream, EveryClassComesBackAsItWas)
 
 TEST(COrrinStream, SizesAreThoseOfTheFormat)
 {
-    // memory: 0 where no figure is fixed
+    // memory: 0 if the size is not fixed
     const std::tuple<Ref<CObject>, uint64_t, uint64_t> rows[] = {
         {new CNode, 108, 212},         {new CBillboardNode, 117, 212},     {new CCamera, 170, 284},
         {new CCameraTarget, 106, 188}, {new CPointLight, 133, 236},        {new CRawData, 56, 56},
@@ -273,7 +273,7 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
 {
     CSceneBytes bytes;
     bytes.Text("any tag").Words({2, 2, 1}).Add<uint16_t>(1).Words({72, 73, 0xdead});
-    bytes.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8); // 6 bytes a row, rounded up to 8
+    bytes.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8); // 6 bytes per row, rounded up to 8
     bytes.Root().Node(1, {}, std::string_view("cut\0off", 7));
     COrrinStream stream;
     ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
@@ -427,8 +427,8 @@ TEST(Links, RingsAreRefusedAndFreed)
 
 namespace {
 
-// A root with as many levels as told, itself included. Written leaf first, so that ids do not follow the
-// nesting.
+// Returns a root with nodes nested to a total depth of `levels`. Written leaf first, so that ids do not
+// follow the nesting.
 std::vector<std::byte> NestedNodes(uint32_t levels)
 {
     CSceneBytes bytes = Scene();
@@ -493,7 +493,7 @@ TEST(Nesting, LongChainsCountLikeChildren)
 
 TEST(Nesting, SharedNodesAreLegalUntilTheirPlacesExplode)
 {
-    // Each level holds the next one twice: as many visits as two to the power of the levels.
+    // Each level holds the next one twice: the number of visits is two to the power of the levels.
     const auto lattice = [](uint32_t levels) {
         CSceneBytes bytes = Scene().Root();
         for (uint32_t level = 1; level < levels; ++level)

@@ -167,7 +167,7 @@ TEST_F(HTMLDump, SharedObjectsHaveOnePageAndAnEntryAtEachPlace)
     for (CNode* child : {shared.Get(), other.Get(), shared.Get()})
         root->AttachChild(child);
     other->AttachChild(shared.Get());
-    shared->AttachChild(root.Get()); // a ring
+    shared->AttachChild(root.Get()); // a cycle
     CHTMLDump dump(m_kFolder.Path());
     dump.WriteSite(*root);
     dump.WriteSite(*other);
@@ -222,7 +222,7 @@ TEST_F(HTMLDump, NoTreeIsTooDeep)
     CHTMLDump dump(m_kFolder.Path("no folder/"));
     dump.WriteSite(*root);
     EXPECT_EQ(dump.PageCount(), kLevels + 3u);
-    while (nodes.size() > 1) // from below, so that they do not die one within the other
+    while (nodes.size() > 1) // bottom up, so that they are not deleted recursively
     {
         nodes[nodes.size() - 2]->DetachChild(nodes.back().Get());
         nodes.pop_back();
@@ -270,7 +270,7 @@ TEST_F(HTMLDump, AFileThatCannotBeOpenedIsPassedOver)
     WriteBytes(m_kFolder.Path("elsewhere"), "kept");
     std::filesystem::create_symlink("elsewhere", m_kFolder.Path("link.htm"));
     ASSERT_EQ(mkfifo(m_kFolder.Path("pipe.htm").c_str(), 0600), 0);
-    for (const char* name : {"Index.htm", "link.htm", "pipe.htm"}) // the last would wait for a reader
+    for (const char* name : {"Index.htm", "link.htm", "pipe.htm"}) // the last one would wait for a reader
         EXPECT_FALSE(page.SaveAs(m_kFolder.Path(name))) << name;
     EXPECT_EQ(Page("elsewhere"), "kept");
     EXPECT_TRUE(page.SaveAsText(m_kFolder.Path("page.htm").c_str()));

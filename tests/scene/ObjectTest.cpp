@@ -35,7 +35,7 @@ TEST(CObject, LivesFromItsFirstReferenceToItsLast)
     EXPECT_EQ(raw->GetRefCount(), 1u);
     CNode* child = new CNode;
     raw->AttachChild(child);
-    held = child; // only what is dropped here keeps it
+    held = child; // only held by the reference that is dropped here
     EXPECT_EQ(watch.Get(), nullptr);
     EXPECT_EQ(held->GetRefCount(), 1u);
     EXPECT_EQ(held->GetParent(), nullptr);
@@ -65,7 +65,7 @@ TEST(CObject, ControlsLiveOnOneObjectOnlyAndKeepTheirOrder)
 TEST(CObject, UpdateWalksControlsModifiersAndCustomData)
 {
     const Ref<CNode> node = new CNode;
-    const Ref<CTestControl> first = new CTestControl(false); // its answer does not stop the walk
+    const Ref<CTestControl> first = new CTestControl(false); // its result does not stop the walk
     const Ref<CTestControl> second = new CTestControl;
     const Ref<CTestControl> onData = new CTestControl;
     const Ref<CTestModifier> modifier = new CTestModifier;
@@ -159,13 +159,13 @@ TEST(CRTTI, AuthorInfoIsNoCustomDataByItsRecord)
 TEST(Clone, IsTheSameGraphWithIdsOfItsOwn)
 {
     Ref<CNode> root = SampleGraph();
-    root->AttachChild(new CNode); // into the empty slot, since a clone's children are packed
+    root->AttachChild(new CNode); // into the empty slot, because a clone's children are packed
     CObject* billboard = root->FindObject(nullptr, &CBillboardNode::ms_kRTTI, false);
     billboard->GetControl()->SetTarget(billboard);
     std::vector<CObject*> clips;
     root->FindObjects(clips, nullptr, &CKeyframeClipControl::ms_kRTTI, false);
     for (CObject* control : clips)
-        static_cast<CControl*>(control)->m_iCycleType = 0; // as a copy has it
+        static_cast<CControl*>(control)->m_iCycleType = 0; // as in a copy
     ++root->m_uiChangeStamp;
 
     CCloneMap map;

@@ -13,8 +13,7 @@
 
 namespace gw {
 
-/// Container bytes put together by hand, value by value, so that tests do not take the writer's word for the
-/// format.
+/// Container bytes assembled by hand, value by value, so that tests do not rely on the writer.
 class CSceneBytes
 {
 public:
@@ -42,25 +41,25 @@ public:
     }
     CSceneBytes& Text(std::string_view text) { return Word(static_cast<uint32_t>(text.size())).Raw(text); }
 
-    /// The 21 bytes at the head of a file.
+    /// Appends the 21 bytes of a file header.
     CSceneBytes& Header(std::string_view version = "1.20")
     {
         return Raw("TKOrrin Version ").Raw(version).Byte(0);
     }
-    /// Tag and block of an empty thumbnail, 58 bytes.
+    /// Appends tag and block of an empty thumbnail, 58 bytes.
     CSceneBytes& EmptyThumbnail()
     {
         Text("_OrrinThumbnail").Words({0, 0, 0}).Add<uint16_t>(0).Words({96, 96, 0});
         return Words({1, 0}).Byte(0).Word(0);
     }
     CSceneBytes& Root() { return Text("_OrrinRoot"); }
-    /// What every record begins with: class, link id, name, heads of the chains.
+    /// Appends the start of every record: class, link id, name, heads of the chains.
     CSceneBytes& Object(std::string_view className, uint32_t id, std::string_view name = {},
                         std::initializer_list<uint32_t> heads = {0, 0, 0})
     {
         return Text(className).Word(id).Text(name).Words(heads);
     }
-    /// What every spatial adds: the identity, the flag, no render states.
+    /// Appends the part common to all spatials: the identity, the flag, no render states.
     CSceneBytes& Spatial() { return Add(kMat4Identity).Byte(1).Word(0); }
     CSceneBytes& Node(uint32_t id, std::span<const uint32_t> children, std::string_view name = {},
                       std::initializer_list<uint32_t> heads = {0, 0, 0})
@@ -76,7 +75,7 @@ public:
     {
         return Node(id, std::span(children.begin(), children.size()), name, heads);
     }
-    /// A track without keys.
+    /// Appends a track without keys.
     CSceneBytes& Track(uint32_t id, uint32_t target, uint32_t next)
     {
         Object("CKeyframeControl", id).Word(0).Float(0).Float(0).Float(0).Float(1).Byte(1);
@@ -97,13 +96,13 @@ private:
     std::vector<std::byte> m_kBytes;
 };
 
-/// The bytes of an object part, records to follow.
+/// Returns the bytes of an object part, ready for records.
 inline CSceneBytes Scene()
 {
     return CSceneBytes().EmptyThumbnail();
 }
 
-/// A description of fields, one a line: values as bytes in hexadecimal, links as places in the save order.
+/// A description of fields, one per line: values as hexadecimal bytes, links as positions in the save order.
 class CFieldDescriber : public CFieldArchive
 {
 public:
@@ -147,7 +146,8 @@ private:
     std::ostringstream m_kText;
 };
 
-/// All that a file of the stream's roots would say, apart from ids: equal texts are equal graphs.
+/// Returns everything that a file of the stream's roots would contain, except ids: equal texts mean equal
+/// graphs.
 inline std::string Describe(COrrinStream& stream)
 {
     const std::vector<CObject*> objects = stream.ObjectsInSaveOrder();
@@ -169,7 +169,7 @@ inline std::string DescribeRoot(CObject* root)
     return Describe(stream);
 }
 
-/// Loads an object part without header, in a block of its own so that one byte too many is seen.
+/// Loads an object part without header from its own buffer, so that one byte too many is noticed.
 inline bool LoadBytes(COrrinStream& stream, std::span<const std::byte> bytes)
 {
     const std::vector<std::byte> block(bytes.begin(), bytes.end());
@@ -183,7 +183,7 @@ inline std::vector<std::byte> SaveBytes(COrrinStream& stream)
     return bytes;
 }
 
-/// What could be read must survive being written and read again.
+/// Returns whether a scene survives being written and read again.
 inline bool SurvivesRewriting(COrrinStream& stream)
 {
     const std::string before = Describe(stream);

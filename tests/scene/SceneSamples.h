@@ -10,7 +10,7 @@
 
 namespace gw {
 
-/// A control that answers as it is told, and counts.
+/// A control with a configurable result that counts its updates.
 class CTestControl : public CControl
 {
 public:
@@ -57,11 +57,11 @@ private:
     size_t m_uiType;
 };
 
-/// A graph with one object of each class of the room and no value at its default, two tracks that share
-/// nothing, a custom data object that two nodes share, an empty slot, and a target that is not the holder.
+/// Returns a graph with one object of each class of the room and no default values: two tracks that share
+/// nothing, a custom data object shared by two nodes, an empty slot, and a target that is not the holder.
 Ref<CNode> SampleGraph();
 
-/// A node with a track whose keys stand at the given times, with positions (time, 0, 0).
+/// Returns a node with a track whose keys have the given times and positions (time, 0, 0).
 Ref<CNode> TrackedNode(const std::vector<float>& times);
 
 } // namespace gw

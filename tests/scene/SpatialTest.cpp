@@ -57,7 +57,7 @@ TEST(CNode, SetChildAtAnswersThePreviousAndGrowsByItsOwnMeasure)
     EXPECT_EQ(previous.Get(), first);
     EXPECT_EQ(first->GetParent(), nullptr);
     EXPECT_EQ(second->GetParent(), node.Get());
-    for (const uint32_t growBy : {0u, 0xffffffffu}) // as a file may have it
+    for (const uint32_t growBy : {0u, 0xffffffffu}) // as a file may contain it
     {
         const Ref<CNode> odd = new CNode(growBy);
         odd->SetChildAt(0, new CNode);

@@ -17,14 +17,14 @@ constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
 constexpr float kInfinity = std::numeric_limits<float>::infinity();
 constexpr float kQuarterTurn = std::numbers::pi_v<float> / 2;
 
-// The x position of the target after an update, which in a tracked node is the key time.
+// Returns the x position of the target after an update, which in a tracked node is the key time.
 float PositionAt(CNode& node, float time)
 {
     node.UpdateScene(time, false);
     return node.m_kMatrix.Translation().x;
 }
 
-// Positions or scales that differ along x.
+// Returns positions or scales that differ along x.
 std::vector<Vec3> Along(std::initializer_list<float> xs, const Vec3& base = kVec3Zero)
 {
     std::vector<Vec3> keys;
@@ -48,7 +48,7 @@ TEST(CKeyArray, HoldsWhatAVectorWouldAndOneKeyWhileAllAreEqual)
     {
         CKeyArray<Vec3> keys;
         std::vector<Vec3> plain;
-        const auto choice = static_cast<unsigned>(random() % 3); // how many values there are
+        const auto choice = static_cast<unsigned>(random() % 3); // number of different values
         const auto next = [&] {
             return Vec3{0.0f, random() % 2 ? 0.0f : -0.0f, static_cast<float>(random() % (choice + 1))};
         };
@@ -202,12 +202,12 @@ TEST(CKeyframeControl, TracksMayHaveAxesOfTheirOwn)
     track.m_kPositionTimes = {0, 10};
     track.m_kScaleKeys = Along({1, 9}, kVec3One);
     track.m_kScaleTimes = {0, 80};
-    track.m_kRotationKeys.push_back({0, 1, 0, 0}); // keys without times count as none
+    track.m_kRotationKeys.push_back({0, 1, 0, 0}); // keys without times are ignored
     node->UpdateScene(5.0f, false);
     EXPECT_EQ(node->m_kMatrix, Mat4Compose(kMat3Identity, {5, 0, 0}, {1.5f, 1, 1}));
     EXPECT_EQ(PositionAt(*node, 20.0f), 10.0f);
     EXPECT_EQ(node->m_kMatrix.m[0], 3.0f);
-    track.m_kKeyTimes = {0, 20}; // a shared axis beats them
+    track.m_kKeyTimes = {0, 20}; // a shared axis takes precedence
     EXPECT_EQ(PositionAt(*node, 5.0f), 2.5f);
     track.m_kKeyTimes.clear();
     track.m_kPositionTimes.clear();
@@ -259,7 +259,7 @@ TEST(CKeyframeControl, DamagedTracksEvaluateToWhatThereIs)
         Track(*node).m_fEndTime = 10.0f;
         EXPECT_EQ(PositionAt(*node, row.time), row.position);
     }
-    // Any axis stands any order of play: nothing to expect but an end, inside the arrays.
+    // Any axis must work in any order of play; only checks that it ends and stays inside the arrays.
     std::vector<float> times = {5, 1, 4, 2, 3, kNaN, kInfinity, 0};
     for (int turn = 0; turn < 8; ++turn)
     {
@@ -276,7 +276,7 @@ TEST(ParentMask, UndoesTheChosenPartsOfTheParentsKeyPose)
 {
     const Mat3 turn = Mat3FromAxisAngle(kVec3UnitY, 1.0f);
     const Mat4 own = Mat4Compose(Mat3FromAxisAngle(kVec3UnitX, 0.5f), {1, 2, 3}, {1, 2, 1});
-    // rotation: what the child must undo
+    // rotation: to be undone by the child
     const std::tuple<const char*, uint32_t, Mat3, Vec3> rows[] = {
         {"nothing", 0, kMat3Identity, kVec3One},        {"rotation", 0x38, turn, kVec3One},
         {"scale", 0x1c0, kMat3Identity, {2, 4, 8}},     {"scale along y", 0x80, kMat3Identity, {1, 4, 1}},
@@ -318,7 +318,7 @@ TEST(ParentMask, UndoesPositionsThroughTheUndoneTurn)
     Track(*parent).m_kRotationKeys = {QuatFromMat3(Mat3FromAxisAngle(kVec3UnitZ, kQuarterTurn))};
     Track(*child).m_uiParentMask = 0x3f;
     parent->UpdateScene(0.0f, false);
-    // The parent's position, turned back: (10, 20, 30) becomes (20, -10, 30).
+    // The parent's position, rotated back: (10, 20, 30) becomes (20, -10, 30).
     EXPECT_NEAR(child->m_kMatrix.Translation().x, 1.0f - 20.0f, 1e-5f);
     EXPECT_NEAR(child->m_kMatrix.Translation().y, 2.0f + 10.0f, 1e-5f);
 }
@@ -333,7 +333,7 @@ TEST(ParentMask, LooksAtTheFirstTrackByItsKeysAlone)
     track->m_kKeyTimes = {0, 10};
     track->m_kPositionKeys = Along({0, 10});
     track->m_fEndTime = 10.0f;
-    track->m_bActive = false; // no rest matrix, no clips, no mask of its own
+    track->m_bActive = false; // without rest matrix, clips or mask
     track->m_uiParentMask = 7;
     parent->AttachChild(other.Get());
     Track(*other).m_uiParentMask = 1;
@@ -378,7 +378,7 @@ TEST(CKeyframeClipControl, PlaysTheScheduleAndIdlesBetween)
         {"a held clip stands at its begin", 47, 30},
         {"and has an end too", 51, 51},
         {"no length", 66, 60},
-        {"backwards has run out at once", 71, 53}, // 11 behind its end, in a loop of 4
+        {"backwards has run out at once", 71, 53}, // 11 after its end, in a loop of 4
         {"no such clip", 85, 3},
         {"before all time", -kInfinity, 50},
         {"no number", kNaN, 3},

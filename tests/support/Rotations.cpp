@@ -8,7 +8,7 @@
 namespace gw {
 namespace {
 
-// Distances and not scalar products: an arc cosine near 1 loses half of the digits.
+// Uses distances instead of dot products: an arc cosine near 1 loses half of the digits.
 double SquaredDistance(const float* a, const float* b, int count, float sign)
 {
     double sum = 0.0;

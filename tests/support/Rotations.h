@@ -5,10 +5,10 @@
 
 namespace gw {
 
-/// The angle in degrees of the turn from one rotation to another, 0 to 180. More than rounding away from a
-/// rotation counts as an angle as well, so that a matrix with a wrong scale or a mirrored one never passes.
+/// Returns the angle in degrees between two rotations, 0 to 180. A deviation from a rotation beyond rounding
+/// also counts as an angle, so a scaled or mirrored matrix never passes.
 double DegreesBetween(const Mat3& a, const Mat3& b);
-/// The same; a quaternion and its negative are 0 degrees apart.
+/// Same; a quaternion and its negative are 0 degrees apart.
 double DegreesBetween(const Quat& a, const Quat& b);
 
 } // namespace gw

@@ -5,8 +5,8 @@
 
 namespace gw {
 
-/// A new folder of its own that goes with all it holds at its end. Its name and its separator come first in
-/// Path.
+/// A new temporary folder, deleted with its contents by the destructor. Path returns paths that start with
+/// its name and a separator.
 class CTempFolder
 {
 public:
@@ -15,20 +15,20 @@ public:
     CTempFolder(const CTempFolder&) = delete;
     CTempFolder& operator=(const CTempFolder&) = delete;
 
-    /// The path of a name in the folder; of the folder itself, with a separator at its end, for no name.
+    /// Returns the path of a name in the folder; without a name, the folder itself with a trailing separator.
     std::string Path(std::string_view name = {}) const { return m_kPath + std::string(name); }
 
 private:
     std::string m_kPath;
 };
 
-/// Makes a file of these bytes or replaces one. A test that cannot write fails.
+/// Creates or replaces a file. If it cannot be written, the test fails.
 void WriteBytes(const std::string& path, std::string_view bytes);
-/// All bytes of a file. A test that cannot read fails, and gets none.
+/// Returns the bytes of a file. If it cannot be read, the test fails and gets no bytes.
 std::string ReadBytes(const std::string& path);
 
-/// The folder of files that are too many for this repository, with a separator at its end. Empty where the
-/// environment names none: tests that need it return then.
+/// Returns the folder of files that are too large for this repository, with a trailing separator. Empty if
+/// the environment does not name one; tests that need it then return.
 std::string SharedDataFolder();
 
 } // namespace gw

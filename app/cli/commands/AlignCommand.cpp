@@ -1,3 +1,5 @@
+// `align`: writes a motion relative to a T-pose, and prints what was corrected.
+
 #include "AlignReport.h"
 #include "CJsonWriter.h"
 #include "CShellConversion.h"

@@ -1,3 +1,5 @@
+// `batch`: the desktop program's folder run, with the same profile rules and messages.
+
 #include "CBatchRun.h"
 #include "CJsonWriter.h"
 #include "CShellConversion.h"

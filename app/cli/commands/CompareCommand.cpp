@@ -1,3 +1,5 @@
+// `compare`: measures how faithful a result is to its source, with both read from files.
+
 #include "BonePairs.h"
 #include "CConversionPage.h"
 #include "CKeyframeControl.h"

@@ -1,3 +1,5 @@
+// `convert`: one source in this process, or many in worker processes.
+
 #include "CConversionPage.h"
 #include "CConversionRun.h"
 #include "CPagePart.h"

@@ -24,7 +24,7 @@ bool WriteTreeView(const std::string& folder)
 {
     COrnHTMLPage script;
     std::string text(kTreeViewScript);
-    text.pop_back(); // each line of a page gets its line feed when it is written
+    text.pop_back(); // the line feed is added when the page is written
     script.AddLine(std::move(text));
     return script.SaveAs(folder + "TreeView.js");
 }

@@ -28,7 +28,7 @@ struct ReportLineOf
     EConversion outcome = EConversion::Failed;
 };
 
-using Lines = std::unordered_map<std::string, ReportLineOf>; // by output
+using Lines = std::unordered_map<std::string, ReportLineOf>; // keyed by output
 
 // A line truncated by a killed run is skipped, and one nested too deeply was not written by a run.
 bool TakeLine(std::string_view text, Lines& lines)

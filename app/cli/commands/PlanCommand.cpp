@@ -1,3 +1,5 @@
+// `plan`: lists the sources of a large run and divides them into shards for several machines.
+
 #include "CJsonMembers.h"
 #include "CJsonWriter.h"
 #include "CRunPlan.h"

@@ -1,3 +1,5 @@
+// `profiles`: lists the installed profiles and, given a source, how well each one fits.
+
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
 #include "CShellReports.h"

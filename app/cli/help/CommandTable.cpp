@@ -1,3 +1,5 @@
+// The table of commands. Parsing, help, man page and completion are all generated from it.
+
 #include "CommandTable.h"
 
 #include <algorithm>

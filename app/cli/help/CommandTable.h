@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// The options that a command can take, one bit each.
+/// Options that a command can accept, one bit each.
 enum EOption : uint64_t
 {
     kOutput = 1ull << 0,

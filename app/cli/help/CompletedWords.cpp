@@ -1,3 +1,5 @@
+// Derives from the tables what can follow an option or be an operand, for all three shells.
+
 #include "CompletedWords.h"
 
 #include "Text.h"

@@ -12,7 +12,7 @@ namespace gw {
 /// What a shell offers for a word of the command line.
 enum class EOffer : uint8_t
 {
-    Nothing, ///< a switch takes no word
+    Nothing, ///< switches have no value
     Any,     ///< a number, or something only the user knows
     Choices, ///< the words in `words`
     Files,   ///< files with an extension in `words` (without dots, lowercase); all files if empty

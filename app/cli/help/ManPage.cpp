@@ -1,3 +1,5 @@
+// Generates the man page from the option and command tables.
+
 #include "ManPage.h"
 
 #include "CompletedWords.h"

@@ -1,3 +1,5 @@
+// The table of options, and the help texts generated from it.
+
 #include "OptionTable.h"
 
 namespace gw {

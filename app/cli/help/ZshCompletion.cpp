@@ -1,3 +1,5 @@
+// Generates the completion script for zsh from the option and command tables.
+
 #include "CompletedWords.h"
 #include "Completion.h"
 

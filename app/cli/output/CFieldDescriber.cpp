@@ -1,3 +1,6 @@
+// Writes the fields of scene objects as JSON members. Counts, blocks and nested lists arrive as separate
+// calls, so a pending count is held back until the next field shows whether it belongs to it.
+
 #include "CFieldDescriber.h"
 
 #include "CJsonWriter.h"

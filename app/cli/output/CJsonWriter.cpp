@@ -1,3 +1,6 @@
+// A streaming JSON writer. Strings are escaped by the JSON library; structure and line breaks are written
+// here.
+
 #include "CJsonWriter.h"
 
 #include <nlohmann/json.hpp>

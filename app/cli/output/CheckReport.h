@@ -7,13 +7,13 @@ namespace gw {
 class CJsonWriter;
 struct MeasuredConversion;
 
-/// What was measured of a conversion, as a compact block of lines that stands under it on standard output.
+/// Prints the measurements of a conversion as a compact block of lines on standard output.
 void PrintCheck(const MeasuredConversion& measured, std::string_view title);
-/// The same as members of a JSON object that is open: all that a comparison has, the parts of the body and
-/// the worst frames.
+/// Writes the same as members of an open JSON object, with all values of a comparison, the parts of the body
+/// and the worst frames.
 void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured);
-/// The figures by which a conversion is judged at a glance, as the member "figures": one number each, or null
-/// where the motion does not have what it tells of.
+/// Writes the key figures of a conversion as the member "figures": one number each, or null if the motion
+/// does not have the feature that it measures.
 void WriteKeyFigures(CJsonWriter& json, const MeasuredConversion& measured);
 
 } // namespace gw

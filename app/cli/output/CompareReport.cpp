@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-// What a figure of a record may be.
+// The type of a record's figure.
 template <class Record>
 using Figure = std::variant<double Record::*, std::optional<double> Record::*, size_t Record::*,
                             int Record::*, bool Record::*, std::string Record::*>;

@@ -7,20 +7,20 @@ namespace gw {
 class CJsonWriter;
 struct ConversionMeasures;
 
-/// How a list of records stands in JSON.
+/// The layout of a list of records in JSON.
 enum class ERecordLayout : uint8_t
 {
-    Lines,   ///< a line for each, for people
-    OneLine, ///< for documents of which each is one line
+    Lines,   ///< one line per record, for people
+    OneLine, ///< everything on one line, for documents that are one line each
 };
 
-/// The figures of a conversion as a table on standard output.
+/// Prints the figures of a conversion as a table on standard output.
 void PrintMeasures(const ConversionMeasures& measures);
-/// The same without the table of bones, each line behind an indent.
+/// Prints the same without the table of bones, each line indented.
 void PrintSums(const ConversionMeasures& measures, const char* indent);
-/// All figures as JSON on standard output; null for those that are missing.
+/// Writes all figures as JSON on standard output; missing ones are null.
 void WriteMeasures(const ConversionMeasures& measures);
-/// The same as members of an object that is open.
+/// Writes the same as members of an open JSON object.
 void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecordLayout layout);
 
 } // namespace gw

@@ -1,3 +1,6 @@
+// Sentences and codes for the doubts about a bone map. Doubts of the same kind share one sentence that lists
+// their joints.
+
 #include "DoubtWords.h"
 
 #include "CJsonWriter.h"

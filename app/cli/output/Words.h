@@ -12,7 +12,7 @@ struct CReport;
 
 /// Prints a line to standard error after the program's name. Names from files must already be printable.
 void SayError(std::string_view words);
-/// The same for a command line that cannot be carried out; false, for its check to return.
+/// The same for an invalid command line. Returns false, so that a check can return the result.
 bool Refuse(std::string_view words);
 /// Same for information that is not a failure; silent with --quiet.
 void SayWord(const ShellOptions& options, std::string_view words);
@@ -25,7 +25,7 @@ void SayFailure(const std::string& path, const CFailure& failure);
 /// Prints all recorded warnings.
 void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record);
 
-/// What stopped the reading of a container: "scene.orn: damaged at byte 381: ...".
+/// Prints what stopped the reading of a container: "scene.orn: damaged at byte 381: ...".
 void SayDamage(const std::string& path, const CFailure& failure);
 
 } // namespace gw

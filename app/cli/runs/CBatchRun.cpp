@@ -1,3 +1,5 @@
+// Runs the desktop program's batch jobs in worker processes, with the outcome of a run in a single process.
+
 #include "CBatchRun.h"
 
 #include "CContentHash.h"

@@ -234,7 +234,8 @@ CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t i
     FileEnd end{.endsRun = !options.keepGoing};
     try
     {
-        if (FolderExists(m_kJobs[index].source)) // an unlistable folder
+        // A folder in the list could not be read, and is reported in place of its files.
+        if (FolderExists(m_kJobs[index].source))
             TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
         else
             end = Convert(options, index, text.File());

@@ -1,3 +1,7 @@
+// One conversion of the shell program: open, choose a profile, convert, save, measure. Each step continues
+// only if the previous one succeeded, and the outcome becomes the result line, the JSON record and a part of
+// the page.
+
 #include "ConvertFile.h"
 
 #include "CJsonWriter.h"
@@ -28,7 +32,7 @@ namespace {
 
 constexpr const char* kOutcomeNames[] = {"converted", "planned", "skipped", "failed"};
 
-/// What is told of a conversion.
+/// The reported facts about a conversion.
 struct Account
 {
     EConversion outcome = EConversion::Failed;
@@ -37,17 +41,17 @@ struct Account
     int frames = 0;
     std::optional<CProfileFit> misfit;
     std::optional<MeasuredConversion> check;
-    std::optional<MeasuredConversion> plainCheck; // of the same motion by the plain rules
-    std::optional<ProfileChoice> chosen; ///< a profile that was neither named nor the stock one of old
+    std::optional<MeasuredConversion> plainCheck; // of the same motion without options
+    std::optional<ProfileChoice> chosen; ///< unless the profile was named or is an original stock one
     const char* whySkipped = "the output exists";
 };
 
-// Leaves a motion to the system, which takes back the memory of a process at once: freeing it object by
-// object is three percent of a small conversion. Only for what a process does last, and not for scenes, whose
-// pictures may have temporary files.
+// Leaves a motion's memory to the system, which frees a whole process faster: deleting object by object takes
+// three percent of a small conversion. Only for the last work of a process, and not for scenes, whose
+// pictures can have temporary files.
 void KeepUntilExit(CNode* root)
 {
-    static std::array<CNode*, 2> keptRoots{}; // what can still be reached is not a leak
+    static std::array<CNode*, 2> keptRoots{}; // reachable memory is not a leak
     const auto free = std::ranges::find(keptRoots, nullptr);
     if (!root || free == keptRoots.end())
         return;
@@ -55,7 +59,7 @@ void KeepUntilExit(CNode* root)
     *free = root;
 }
 
-// One job, step by step. Each step answers whether the next may follow.
+// One job, step by step. Each step returns whether the next one may follow.
 class CJobSteps
 {
 public:
@@ -66,7 +70,7 @@ public:
     {
     }
 
-    /// For the only conversion of a process.
+    /// For a process's only conversion.
     void KeepMotionsUntilExit() const
     {
         if (HasExtension(job_.source, ".orn"))
@@ -83,7 +87,7 @@ public:
             return EConversion::Planned;
         if (!Convert())
             return EConversion::Failed;
-        // Another run may have made it meanwhile, such as the workers of one that was killed.
+        // Another run may have made it meanwhile, such as the workers of a killed one.
         if (options_.skipExisting && IsTaken(job_.output))
             return EConversion::Skipped;
         if (!m_kConversion.WriteResult(job_.output) || reports_.HasFailed())
@@ -108,7 +112,7 @@ private:
     const ConversionJob& job_;
     CShellReports& reports_;
     Account& account_;
-    CPagePart* m_pkPart; // null where no page is asked for
+    CPagePart* m_pkPart; // null if no page is requested
     CShellConversion m_kConversion;
 };
 
@@ -146,7 +150,7 @@ bool CJobSteps::Convert()
     return m_kConversion.HasFrames();
 }
 
-// The result is saved: a measuring poses both trees.
+// Called after saving, because measuring poses both trees.
 void CJobSteps::Check()
 {
     ConvertedMotion motion = MotionOf(m_kConversion, job_);
@@ -202,7 +206,7 @@ void WriteChecks(CJsonWriter& json, const Account& account)
     json.EndObject();
 }
 
-// How sure the choice is stands behind a profile that was chosen.
+// The confidence follows the name of a profile that was chosen automatically.
 std::string ProfileWords(const Account& account)
 {
     const std::string name = Quoted(account.profile);

@@ -1,3 +1,6 @@
+// Stores options in plans and resume keys. Only options that differ from their defaults are written, so
+// spelling out a default changes nothing.
+
 #include "OptionJson.h"
 
 #include "CJsonMembers.h"

@@ -1,3 +1,5 @@
+// Failures and warnings as JSON, and back. A run's parent process reads its workers' records this way.
+
 #include "ReportJson.h"
 
 #include "CFailure.h"

@@ -1,3 +1,6 @@
+// Expands the files and folders of a command line into sources, each with the relative path that its result
+// keeps below the output folder.
+
 #include "SourceList.h"
 
 #include "CMappedFile.h"

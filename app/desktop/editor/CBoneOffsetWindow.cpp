@@ -1,3 +1,5 @@
+// The window of the offset dialog: fields and boxes on top of CBoneOffsetDialog, which has the rules.
+
 #include "CBoneOffsetWindow.h"
 
 #include "CBoneOffsetDialog.h"

@@ -1,3 +1,5 @@
+// Creates and arranges the controls of the profile editor; CProfileEditorWindow connects them.
+
 #include "CEditorControls.h"
 
 #include "CBoneTreeView.h"

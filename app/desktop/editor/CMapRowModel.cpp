@@ -1,3 +1,6 @@
+// Applies a changed row table to the view with as few changes as possible, so that scrolling and selection
+// survive.
+
 #include "CMapRowModel.h"
 
 #include "QtText.h"

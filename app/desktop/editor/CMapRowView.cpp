@@ -1,3 +1,5 @@
+// The table view of the editor's rows: reports selections and clicks to the model, by mouse or keyboard.
+
 #include "CMapRowView.h"
 
 #include "CGaitConvertContent.h"

@@ -1,3 +1,6 @@
+// The profile editor's window. Most of the code deals with focus: a field is committed when it loses the
+// keyboard, which also happens when a button is pressed, a message box opens or the window closes.
+
 #include "CProfileEditorWindow.h"
 
 #include "CBoneOffsetWindow.h"

@@ -24,7 +24,7 @@ class CSkin;
 class CContent : public QWidget, public CContentWindow
 {
 public:
-    /// Keys must outlive the face; the skin need not.
+    /// The keys must outlive the content; the skin need not.
     CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame);
     ~CContent() override;
 

@@ -36,7 +36,7 @@ constexpr const char* kPlaceSetting = "WindowPos";
 constexpr int kMenuMilliseconds = 5;
 constexpr int kRetryMilliseconds = 200;
 
-// Keys that click a child.
+// Keys that click a widget.
 struct Key
 {
     QKeyCombination keys;

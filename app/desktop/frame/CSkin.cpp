@@ -1,3 +1,6 @@
+// Reads a skin folder: the layout of the face line by line, its texts, style sheet and icons. A skin without
+// all children that the program needs is refused with a description of the problem.
+
 #include "CSkin.h"
 
 #include "CMappedFile.h"

@@ -15,13 +15,13 @@ struct SkinChild
 {
     std::string kind;
     std::string name; ///< starts with "#" for displays, "|" for scroll bars, "%" for two-state buttons
-    QRect place;      ///< in pixels at scale 1
-    std::string icon; ///< a picture's name, or empty
+    QRect place;      ///< pixels at scale 1
+    std::string icon; ///< name of a picture, or empty
     std::string secondIcon;
 };
 
-/// The skin of the main window: a folder with the face's layout (bvh.cnt), its texts (bvh.ini), the style of
-/// all windows (bvh.qss) and the pictures (icons/).
+/// The skin of the main window: a folder with the layout (bvh.cnt), the texts (bvh.ini), the style of all
+/// windows (bvh.qss) and the pictures (icons/).
 class CSkin
 {
 public:

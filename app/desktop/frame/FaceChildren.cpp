@@ -1,3 +1,5 @@
+// Creates the widgets of the face from the skin's kinds: buttons, displays, lists, images and bars.
+
 #include "FaceChildren.h"
 
 #include "CPlaybar.h"

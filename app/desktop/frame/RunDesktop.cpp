@@ -1,3 +1,6 @@
+// Start and end of the desktop program: arguments, a second instance, the missing display, the main window or
+// the map tool.
+
 #include "RunDesktop.h"
 
 #include "CFilePlatform.h"

@@ -1,3 +1,5 @@
+// The map tool's window. It shows the tool's state after every operation and keeps none itself.
+
 #include "CGaitToolWindow.h"
 
 #include "CBoneTreeView.h"

@@ -26,7 +26,7 @@ class CMotionPanel;
 class CGaitToolWindow : public QDialog, private CToolWindow
 {
 public:
-    /// Both must outlive the window.
+    /// Both arguments must outlive the window.
     CGaitToolWindow(const CPlatform& platform, const CLeftKeys& keys);
     ~CGaitToolWindow() override;
 
@@ -45,7 +45,7 @@ private:
     void BeginWaitCursor() override;
     void EndWaitCursor() override;
 
-    // ToolLayout.cpp
+    // Defined in ToolLayout.cpp.
     void MakeMenu();
     void MakeLayout(const CLeftKeys& keys);
     void MakeTop(QGridLayout& grid);

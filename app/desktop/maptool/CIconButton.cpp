@@ -1,3 +1,6 @@
+// Draws the small buttons' pictures as polygons, so that they are sharp at any scale and follow the text
+// color.
+
 #include "CIconButton.h"
 
 #include <QPaintEvent>
@@ -98,7 +101,7 @@ void CIconButton::paintEvent(QPaintEvent* event)
     QPushButton::paintEvent(event);
     QPainter painter(this);
     painter.setRenderHint(QPainter::Antialiasing);
-    // On whole pixels, so that bars have sharp edges.
+    // Aligned to whole pixels, so that bars have sharp edges.
     painter.translate(QPoint(qRound((width() - kIconSide) / 2), qRound((height() - kIconSide) / 2)));
     painter.fillPath(PathOf(m_eIcon), palette().color(QPalette::ButtonText));
 }

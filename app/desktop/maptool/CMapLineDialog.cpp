@@ -1,3 +1,5 @@
+// The dialog of a map line. A table describes the fields of each kind of line.
+
 #include "CMapLineDialog.h"
 
 #include "ProfileFile.h"

@@ -1,3 +1,5 @@
+// A preview panel of the map tool. Without OpenGL, it has a caption and buttons but no picture.
+
 #include "CMotionPanel.h"
 
 #include "CGaitToolDialog.h"

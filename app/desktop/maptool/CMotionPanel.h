@@ -25,7 +25,7 @@ public:
     /// Creates a view. Without GL, the view draws nothing.
     std::unique_ptr<CMotionView> MakeView();
     void ShowFrame(int frame, int lastFrame);
-    /// Called with the id of a transport button.
+    /// Sets the function to call with the id of a clicked transport button.
     void SetClicked(std::function<void(int id)> clicked) { clicked_ = std::move(clicked); }
     /// Called with a dropped motion file. If not set, nothing can be dropped.
     void SetDropped(std::function<void(const QString& path)> dropped);

@@ -195,7 +195,7 @@ QPushButton* CGaitToolWindow::MakeButton(int id)
     button->setObjectName(QString::number(id));
     button->setAccessibleName(button->text());
     button->setAutoDefault(false); // Enter in a tree or list must not click it
-    button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Preferred); // as high as its row
+    button->setSizePolicy(QSizePolicy::Minimum, QSizePolicy::Preferred); // same height as its row
     connect(button, &QPushButton::clicked, this, [this, id] { Click(id); });
     m_kButtons.push_back(button);
     return button;

@@ -24,7 +24,7 @@ constexpr Image kImages[] = {
     {"mapped in the target", 0xffe0a33e, true },
 };
 
-constexpr qreal kDotShare = 0.5; // of the icon's size
+constexpr qreal kDotShare = 0.5; // as a share of the icon's size
 constexpr qreal kRingShare = 0.1;
 
 // Draws the dot at the requested size instead of scaling a picture.

@@ -1,3 +1,5 @@
+// Shows a bone tree. A tree with the same names is updated in place; only other names rebuild the items.
+
 #include "CBoneTreeView.h"
 
 #include "BoneMarker.h"

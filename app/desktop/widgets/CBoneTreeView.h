@@ -31,7 +31,7 @@ private:
         int m_iParent = CBoneTree::kNone;
         bool m_bMapped = false;
         bool m_bFolded = false;
-        QTreeWidgetItem* m_pkItem = nullptr; ///< null while the filter hides it
+        QTreeWidgetItem* m_pkItem = nullptr; ///< null if the filter hides it
     };
 
     bool HasBonesOf(const CBoneTree& tree) const;

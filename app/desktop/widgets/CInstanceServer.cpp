@@ -1,3 +1,6 @@
+// A local socket over which a second start passes its file to the first instance. The socket is in a folder
+// that only the user can write to, and every message is checked before it is used.
+
 #include "CInstanceServer.h"
 
 #include "InstanceMessage.h"

@@ -137,7 +137,7 @@ CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& 
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(kDialogMargin, kDialogMargin, kDialogMargin, kDialogMargin);
     layout->setSpacing(kDialogMargin);
-    layout->setSizeConstraint(QLayout::SetFixedSize); // grows and shrinks with the details
+    layout->setSizeConstraint(QLayout::SetFixedSize); // resizes with the details
     layout->addLayout(top);
     layout->addStrut(kLeastWidth);
     if (!details.isEmpty())

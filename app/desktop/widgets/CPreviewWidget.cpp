@@ -1,3 +1,6 @@
+// Draws a view with OpenGL. Machines without a usable context are detected before the toolkit can end the
+// program.
+
 #include "CPreviewWidget.h"
 
 #include "CLeftKeys.h"

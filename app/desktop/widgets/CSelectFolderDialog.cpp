@@ -1,3 +1,5 @@
+// The folder dialog: a list that opens folders, and a path that can be edited.
+
 #include "CSelectFolderDialog.h"
 
 #include "CMessageBox.h"
@@ -65,7 +67,7 @@ public:
 
 private:
     QIcon m_kFolderIcon;
-    QPixmap m_kNoIcon; // keeps the names in one column
+    QPixmap m_kNoIcon; // keeps the names aligned
 };
 
 QString BeginningFolder(const std::string& wanted)

@@ -1,3 +1,6 @@
+// Selects the stream for a motion file by its extension and takes its trees if it succeeds. Here, the
+// streams' exceptions end: callers only see a bool and the record.
+
 #include "CMotionFile.h"
 
 #include "CKeyframeControl.h"

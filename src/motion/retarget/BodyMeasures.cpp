@@ -1,3 +1,8 @@
+// Computes the scale from source to target as the ratio of hip height plus leg length. Two walkers climb from
+// both feet toward the hips; the left one measures the leg, and the middle between them is the pelvis. The
+// ratio is then corrected by how far the target's proportions are from the usual ones, which differ between
+// legs with and without extra joints.
+
 #include "CRetargeter.h"
 #include "HostBones.h"
 #include "Skeleton.h"
@@ -8,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// The norms of the target family's proportions and what straying from them costs.
+// Normal proportions of the target family, and the cost of deviating from them.
 constexpr float kLongNorm = 8.5f;
 constexpr float kLongBend = 0.0075f;
 constexpr float kShortNorm = 5.1f;
@@ -21,7 +26,7 @@ double SecondRowLength(const CSpatial* node)
     return node ? Vec3Length(node->m_kWorldMatrix.Row(1)) : 1.0;
 }
 
-// The links of a target leg: the first step up from the foot's parent is not counted.
+// Counts the links of a target leg, without the first step up from the foot's parent.
 int TargetLinks(const CNode* foot)
 {
     int links = 0;
@@ -42,7 +47,7 @@ int SourceLinks(const CNode* foot, const CNode* thigh)
     return links;
 }
 
-// Two walkers that climb from the feet side by side; the left one measures.
+// Two walkers that climb from both feet in parallel; the left one measures.
 struct LegWalk
 {
     const CNode* left;

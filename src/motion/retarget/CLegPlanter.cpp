@@ -1,3 +1,8 @@
+// Plants feet by inverse kinematics. For each leg, the source's ankle relative to its pelvis, scaled to the
+// target, becomes the goal of a closed-form solver (CLimbChain), and the source's knee the hint for its bend.
+// The solver works in its own frame, in which the hinge axis is Y, so goals and results pass through
+// AxisSwapForward and back.
+
 #include "CLegPlanter.h"
 
 #include "CFaithfulLeg.h"
@@ -11,8 +16,8 @@ namespace gw {
 
 namespace {
 
-// The solver's rotations come back into the bones' frame by its axis swap. That is what the "YXZ" angles x,
-// y, z of the rotation make of Ry(-z) · Rz(x) · Rx(-y), without the angles.
+// Converts the solver's rotations back to the bones' frame. Equivalent to Ry(-z) · Rz(x) · Rx(-y), where x,
+// y, z are the rotation's "YXZ" angles, but without computing the angles.
 Mat3 LimbToBone(const Mat3& m)
 {
     const Vec3 rows[] = {-m.Row(1), -m.Row(2), m.Row(0)};
@@ -88,7 +93,7 @@ void CLegPlanter::UpdatePath(const LegRecord& leg)
         matcher_.UpdateWorld(bone);
 }
 
-// The length of a bone's translation under its parent's scale along the bone.
+// Returns the length of a bone's translation under its parent's scale along the bone.
 double CLegPlanter::SegmentLength(size_t index) const
 {
     const CPoseMatcher::Bone& bone = matcher_.Bones()[index];
@@ -96,7 +101,7 @@ double CLegPlanter::SegmentLength(size_t index) const
     return Vec3Length(bone.translation) * Vec3Length(parentWorld.Row(1));
 }
 
-// A point before the source's thigh, toward which the knee bends.
+// Returns a point in front of the source's thigh, toward which the knee bends.
 Vec3 CLegPlanter::HintPoint(const LegRecord& leg) const
 {
     if (!leg.sourceThigh)
@@ -107,7 +112,8 @@ Vec3 CLegPlanter::HintPoint(const LegRecord& leg) const
     return parent ? TransformCoord(point, parent->m_kWorldMatrix) : point;
 }
 
-// The ankle's goal, and the point toward which the knee bends, as seen from the hip in the solver's frame.
+// Computes the ankle's goal, and the point toward which the knee bends, relative to the hip in the solver's
+// frame.
 void CLegPlanter::LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const
 {
     const auto& bones = matcher_.Bones();

@@ -11,20 +11,20 @@ class CFaithfulLeg;
 class CKeyframeControl;
 struct HostSide;
 
-/// Plants the feet: turns the thigh and calf of each leg so that the ankle stands where the source's does,
-/// scaled, as seen from the pelvis. Feet keep the rotation that they have.
+/// Plants the feet: rotates thigh and calf of each leg so that the ankle's position relative to the pelvis is
+/// the source's, scaled. Feet keep their rotation.
 class CLegPlanter
 {
 public:
-    /// Plans the legs LThigh to LFoot and RThigh to RFoot. A leg of which a bone or a source is missing is
-    /// left alone.
+    /// Plans the legs LThigh to LFoot and RThigh to RFoot. A leg with a missing bone or source is not
+    /// planted.
     CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode& targetRoot);
 
-    /// Leaves legs alone from now on that are posed otherwise.
+    /// Excludes legs that are posed by other means.
     void LeaveOut(const std::vector<CFaithfulLeg>& legs);
 
-    /// Replaces the rotation keys of a frame where a leg can be solved. `tracks` stand in the order of the
-    /// bones; `scale` is the body measure.
+    /// Replaces the rotation keys of a frame for each leg that can be solved. `tracks` are in bone order;
+    /// `scale` is the body scale.
     void Plant(size_t frame, float scale, const std::vector<CKeyframeControl*>& tracks);
 
 private:
@@ -34,7 +34,7 @@ private:
         size_t calf;
         size_t foot;
         const CNode* sourceFoot;
-        const CNode* sourceThigh; ///< of the calf's parent; may be null
+        const CNode* sourceThigh; ///< source of the calf's parent; can be null
         Mat3 thighOffset;
         Mat3 calfOffset;
         std::vector<size_t> path; ///< from the root down to the calf

@@ -133,7 +133,7 @@ constexpr const char* kTargetBones[][2] = {
     {"RCalf", "RThigh"},      {"RFoot", "RCalf"},
 };
 
-// A hip, a waist and two legs that hang down; one frame.
+// A hip, a waist and two legs pointing down; one frame.
 std::string TargetText()
 {
     std::string text =

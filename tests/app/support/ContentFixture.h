@@ -16,7 +16,7 @@
 
 namespace gw {
 
-/// The program's own view, which tells what it shows.
+/// A view that records what it shows.
 class CWatchedView : public CGLView
 {
 public:
@@ -29,7 +29,7 @@ public:
     Ref<CNode> m_spkShown;
 };
 
-/// A window that answers from a script and writes down what it was asked.
+/// A window with scripted answers that records what it was asked.
 class CScriptedWindow : public CContentWindow
 {
 public:
@@ -64,20 +64,20 @@ public:
     void RefreshProfileEditor() override { onRefreshEditor(); }
     bool RunBoneOffset(CBoneOffsetDialog& dialog) override { return onBoneOffset(dialog); }
 
-    /// The enabled children, with blanks between them, in no order that matters.
+    /// Returns the enabled children, separated by blanks, in any order.
     std::set<std::string> Enabled() const;
-    /// What was called since the last time.
+    /// Returns the calls since the last time.
     std::vector<std::string> TakeCalls() { return std::exchange(m_kCalls, {}); }
-    /// Of these the reports and message boxes: "not-found, 138".
+    /// Returns only the reports and message boxes: "not-found, 138".
     std::string TakeWords();
 
     std::optional<std::string> openAnswer;
     std::optional<std::string> saveAnswer;
     std::optional<FolderChoice> folderAnswer;
-    std::map<int, EAnswer> m_kAnswers; ///< by message; all others are answered with OK
+    std::map<int, EAnswer> m_kAnswers; ///< by message; others are answered with OK
     std::set<EKey> m_kKeys;
-    std::function<void()> onPaint = [] {}; ///< what happens in the midst of an operation
-    std::function<void()> onBox = [] {};   ///< what else happens while a message box is open
+    std::function<void()> onPaint = [] {}; ///< runs during an operation
+    std::function<void()> onBox = [] {};   ///< runs while a message box is open
     std::function<void(bool shown)> onShowEditor = [](bool) {};
     std::function<void()> onRefreshEditor = [] {};
     std::function<bool(CBoneOffsetDialog& dialog)> onBoneOffset = [](CBoneOffsetDialog&) { return false; };
@@ -85,7 +85,7 @@ public:
     std::map<std::string, bool> m_kEnabled;
     std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"
     std::vector<std::string> m_kTitles;
-    std::string m_kPlace;              ///< frame and seconds beside the bar
+    std::string m_kPlace;              ///< frame and seconds next to the bar
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes
     std::vector<std::string> m_kCalls;
     CWatchedView* m_pkSource = nullptr;
@@ -97,7 +97,7 @@ public:
     bool m_bProgressDue = false;
 };
 
-/// Settings in memory, folders in one temporary folder: data/ and docs/.
+/// Settings in memory, and folders data/ and docs/ in a temporary folder.
 class CScriptedPlatform : public CPlatform
 {
 public:
@@ -119,10 +119,10 @@ private:
     const CTempFolder& m_kFolder;
 };
 
-/// The words of a text, in an order that does not matter.
+/// Returns the words of a text as a set.
 std::set<std::string> Words(std::string_view text);
 
-/// The bones of a source skeleton, from the hip to the feet.
+/// The bones of a source skeleton, from hip to feet.
 struct SourceBones
 {
     std::string hip, leftThigh, leftCalf, leftFoot, rightThigh, rightCalf, rightFoot;
@@ -130,7 +130,7 @@ struct SourceBones
 extern const SourceBones kPoserBones;
 extern const SourceBones kMaxBones;
 
-/// A BVH file that walks on the spot, and a profile that fits it.
+/// Returns a BVH file that walks on the spot; a profile that fits it exists.
 std::string BvhText(const SourceBones& bones, int frameCount = 3);
 std::string BoneMapText(const std::string& name, const SourceBones& bones);
 
@@ -141,15 +141,15 @@ class ContentTest : public testing::Test
 protected:
     ContentTest();
 
-    /// Writes a file into the temporary folder and answers its path.
+    /// Writes a file into the temporary folder and returns its path.
     std::string Write(const std::string& name, const std::string& text) const;
     std::string Read(const std::string& name) const;
     bool Exists(const std::string& name) const;
-    /// Writes a container whose node and track are named as asked, and answers its path.
+    /// Writes a container with the given node and track names, and returns its path.
     std::string WriteContainer(const std::string& name, bool withTrack = true) const;
 
     int Open(const std::string& path);
-    /// What a user does, in order: "open walk.bvh, click play, select Mine".
+    /// Performs user actions in order: "open walk.bvh, click play, select Mine".
     void Do(std::string_view steps);
     /// Opens a source and converts it with the stock profile that fits.
     void OpenAndConvert();

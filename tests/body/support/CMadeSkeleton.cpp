@@ -23,7 +23,7 @@ Vec3 Through(const Vec3& v, const Mat3& m)
     return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
 }
 
-// Some rotation that takes +x to a direction.
+// Returns any rotation that takes +x to a direction.
 Mat3 AlongX(const Vec3& direction)
 {
     const Vec3 x = Vec3Normalized(direction);
@@ -109,7 +109,7 @@ CMadeSkeleton::Joint& CMadeSkeleton::AddAt(Joint& parent, const Vec3& place, Bod
     return joint;
 }
 
-// The joint at the end of a bone that begins at another, with the twist joints of that bone.
+// Adds the joint at the end of a bone, with the bone's twist joints.
 CMadeSkeleton::Joint& CMadeSkeleton::AddBone(Joint& from, const Vec3& to, BodyPlace role, bool twists)
 {
     const Vec3 middle = (from.place + to) * 0.5f;
@@ -255,7 +255,7 @@ void CMadeSkeleton::AddFingers(Joint& hand, const Vec3& along)
     }
 }
 
-// Turns the frame of every joint so that its first child lies along x.
+// Rotates the frame of every joint so that its first child is along x.
 void CMadeSkeleton::TurnFrames(Joint& joint)
 {
     const Vec3 bone = joint.children.empty() ? joint.tip : joint.children.front()->place - joint.place;
@@ -265,7 +265,7 @@ void CMadeSkeleton::TurnFrames(Joint& joint)
         TurnFrames(*child);
 }
 
-// From the stance's axes to those of the file.
+// Converts from the stance's axes to the file's.
 Vec3 CMadeSkeleton::World(const Vec3& place) const
 {
     Vec3 world = Has("turned") ? Through(place, kTurned) : place;
@@ -289,8 +289,8 @@ void CMadeSkeleton::AppendJoints(std::vector<TextJoint>& joints, const Joint& jo
         AppendJoints(joints, *child, self);
 }
 
-// The angles of a joint and of those below it, in a step of the walk; legs and arms swing about the x of the
-// stance, knees only backward.
+// Appends the angles of a joint and its subtree for a step of the walk; legs and arms swing about the
+// stance's x axis, knees only backward.
 void CMadeSkeleton::AppendRotations(std::vector<Vec3>& degrees, const Joint& joint, const Mat3& parentTurn,
                                     double phase) const
 {
@@ -300,7 +300,7 @@ void CMadeSkeleton::AppendRotations(std::vector<Vec3>& degrees, const Joint& joi
     Mat3 turn = Turn(joint.swing * amount);
     if (amount != 0.0f)
     {
-        // The axis of the swing in the file's axes.
+        // The swing axis in the file's axes.
         Mat3 axes;
         axes.SetRow(0, Vec3Normalized(World(kVec3UnitX)));
         axes.SetRow(1, Vec3Normalized(World(kVec3UnitY)));

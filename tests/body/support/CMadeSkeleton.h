@@ -14,22 +14,22 @@
 
 namespace gw {
 
-/// A human skeleton made after a recipe, with names that say nothing, written as a motion file and loaded. It
-/// stands in metres or centimetres, its joints a little off from left to right, as measured ones are.
+/// A human skeleton made from a recipe, with meaningless names, written as a motion file and loaded. Its unit
+/// is meters or centimeters, and left and right differ a little, as in measured skeletons.
 ///
-/// A recipe is words with blanks in between:
-/// spine1 ... spine10, neck0 ... neck3  numbers of joints; else three and one
-/// noclavicle, notoes, nofeet           joints that are not there; a foot without a toe has a bone to its tip
+/// A recipe is a list of words separated by blanks:
+/// spine1 ... spine10, neck0 ... neck3  numbers of joints; default: three and one
+/// noclavicle, notoes, nofeet           missing joints; a foot without a toe has a bone to its tip
 /// bare                                 end joints have no bones
 /// fingers, toes5, face, headend        joints beyond hands, feet and head
 /// helpers                              a joint before each limb that carries its offset, and one of length 0
 /// hipjoints                            a short joint between pelvis and thigh
-/// twist, twistleaf                     joints inside the long bones, or hanging beside them
-/// root, prop, sword, tail              a joint above the hip at the floor; things that hang about
-/// rightfirst, torsofirst               the order of children; else the left leg comes first
+/// twist, twistleaf                     joints inside the long bones, or beside them
+/// root, prop, sword, tail              a joint above the hip at the floor; additional objects
+/// rightfirst, torsofirst               the order of children; default: the left leg comes first
 /// zup, turned                          up is z; the body looks along -x
-/// apose, down                          the arms at rest; else they stretch sideways
-/// nopose                               at rest all bones lie along x, and frames show how it stands
+/// apose, down                          the arms at rest; default: stretched sideways
+/// nopose                               at rest all bones are along x; only frames show the stance
 /// walk                                 frames in which it walks
 /// rest                                 the frames show the rest pose
 /// child, longarms, metres              proportions and unit
@@ -40,18 +40,18 @@ public:
 
     CNode& Root() const { return *m_kMotion.motionRoot; }
     const CMotionFile& Motion() const { return m_kMotion; }
-    /// The name of a place of the body; empty where the skeleton has none.
+    /// Returns the name at a place of the body; empty if the skeleton has none.
     std::string NameAt(BodyPlace place) const;
 
 private:
     struct Joint
     {
         std::string name;
-        Vec3 place; // in a stance with y up and the body looking along z
+        Vec3 place; // in a stance with y up and the body facing z
         Joint* parent = nullptr;
         std::vector<std::unique_ptr<Joint>> children;
-        Vec3 tip = kVec3Zero;   // of an end joint, from its place
-        Vec3 swing = kVec3Zero; // amplitude of turns about the axes while it walks, degrees
+        Vec3 tip = kVec3Zero;   // of an end joint, relative to its place
+        Vec3 swing = kVec3Zero; // amplitude of rotations about the axes while walking, in degrees
         Mat3 world = kMat3Identity;
     };
 
@@ -84,7 +84,7 @@ private:
     CMotionFile m_kMotion;
 };
 
-/// Recipes of the shapes that skeletons come in.
+/// Returns recipes for the usual shapes of skeletons.
 std::vector<std::string> SkeletonRecipes();
 
 } // namespace gw

@@ -8,21 +8,21 @@
 
 namespace gw {
 
-/// A joint of the text of a BVH file. Parents stand before their children.
+/// A joint in the text of a BVH file. Parents come before their children.
 struct TextJoint
 {
     std::string name;
     int parent = -1; ///< -1 for the root
     Vec3 offset;
     Vec3 tip{0.0f, 6.0f, 0.0f}; ///< of a joint without children
-    bool hasPositions = false;  ///< six channels; the root always has them
+    bool hasPositions = false;  ///< six channels; always true for the root
 };
 
-/// What a row says of a joint.
+/// The values of a joint in a row.
 struct TextKey
 {
     Vec3 position;
-    Vec3 degrees; ///< about X, Y and Z; they are written as rotations about Z, X and Y
+    Vec3 degrees; ///< about X, Y and Z; written as rotations about Z, X and Y
 };
 
 /// Writes BVH files of made figures.
@@ -31,11 +31,11 @@ class CMadeText
 public:
     explicit CMadeText(std::vector<TextJoint> joints) : m_kJoints(std::move(joints)) {}
 
-    /// The text of so many frames; `key` is asked once for every frame and joint.
+    /// Returns a text with that many frames; `key` is called once per frame and joint.
     std::string Write(int frameCount, double frameSeconds,
                       const std::function<TextKey(size_t joint, int frame)>& key);
 
-    bool m_bScientific = false; ///< numbers like 9.0000000e+01
+    bool m_bScientific = false; ///< writes numbers like 9.0000000e+01
 
 private:
     void Line(size_t depth, const std::string& words);
@@ -44,7 +44,7 @@ private:
     void AddJoint(size_t joint, size_t depth);
 
     std::vector<TextJoint> m_kJoints;
-    std::vector<size_t> m_kOrder; // of the columns: depth first
+    std::vector<size_t> m_kOrder; // order of the columns: depth first
     std::string m_kText;
 };
 
