@@ -144,6 +144,18 @@ void CBoneAimer::Aim()
 
 } // namespace
 
+void DriveHands(CRetargeter& table, CNode& targetRoot, const CBodyMap& body)
+{
+    for (const EBodySide side : kBodySides)
+    {
+        CNode* const hand = FindNode(&targetRoot, kHostSides[static_cast<size_t>(side)].hand);
+        bool fixed = false;
+        table.IsFixed(hand, fixed);
+        if (hand && !fixed && !table.SourceOf(hand) && body.Arm(side).hand)
+            table.SetSourceOf(hand, body.Arm(side).hand);
+    }
+}
+
 void AimBones(CRetargeter& table, CNode& targetRoot, const BodyMotion& source, const Alignment& alignment,
               const AlignedMotion& aligned)
 {

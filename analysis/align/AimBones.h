@@ -3,10 +3,14 @@
 namespace gw {
 
 class CNode;
+struct CBodyMap;
 class CRetargeter;
 struct BodyMotion;
 struct Alignment;
 struct AlignedMotion;
+
+/// Lets the hands that a body has drive those of the target that no row of the map drives or fixes.
+void DriveHands(CRetargeter& table, CNode& targetRoot, const CBodyMap& body);
 
 /// Hands a retargeter, filled for the source, over to the aligned motion. Every target bone that a row drives
 /// points as its source does: offsets become what takes the source's aligned rest pose to the target's, and

@@ -5,9 +5,17 @@
 #include "Mat3.h"
 
 #include <cstddef>
+#include <cstdint>
 #include <vector>
 
 namespace gw {
+
+/// Along which way a limb's bone is taken to lie.
+enum class ELimbWays : uint8_t
+{
+    Offsets, ///< that to the next joint at rest
+    Mean,    ///< for a joint below that the motion moves, the mean one of the motion
+};
 
 /// A motion that is to be aligned, and what its joints are. The tree is looked at and not kept alive; it is
 /// posed on the way and left at time 0.
@@ -17,6 +25,7 @@ struct BodyMotion
     float frequency = 0.0f; ///< seconds from frame to frame
     int frameCount = 0;
     CBodyMap body;
+    ELimbWays limbs = ELimbWays::Offsets;
 };
 
 /// What an alignment does to one joint.

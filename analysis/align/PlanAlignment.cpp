@@ -2,6 +2,7 @@
 #include "Alignment.h"
 #include "BodyPose.h"
 #include "BodyStance.h"
+#include "CKeyframeControl.h"
 #include "CMotionEvidence.h"
 #include "CReferencePose.h"
 #include "CTreePoser.h"
@@ -9,8 +10,10 @@
 #include "DoubledOffsets.h"
 #include "JointTurns.h"
 #include "Skeleton.h"
-#include "WorldUp.h"
+#include "UpAxis.h"
 
+#include <algorithm>
+#include <array>
 #include <cmath>
 
 namespace gw {
@@ -39,20 +42,6 @@ void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& d
     }
 }
 
-// Whether bone rotations can be measured in a rest pose: the legs continue the trunk, and shoulders and feet
-// face the same way as the hips. Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside
-// the bones' real ends.
-bool IsReference(const BodyStance& stance)
-{
-    constexpr double kTrunkLimit = 40.0;
-    constexpr double kLegLimit = 40.0;
-    constexpr double kShoulderLimit = 35.0;
-    constexpr double kFootLimit = 70.0;
-    return stance.left != kVec3Zero && AngleBetween(stance.up, NearestAxis(stance.up)) < kTrunkLimit &&
-           stance.thighs.value_or(180.0) < kLegLimit && stance.shins.value_or(180.0) < kLegLimit &&
-           stance.shoulders.value_or(0.0) < kShoulderLimit && stance.feet < kFootLimit;
-}
-
 // Joints of the trunk that stand where the next one stands: they turn nothing but what is above that.
 std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<JointRole>& roles, double leg)
 {
@@ -72,6 +61,39 @@ std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<Jo
             ways.push_back({from, to});
     }
     return ways;
+}
+
+bool IsLimb(EBodyPart part)
+{
+    return part == EBodyPart::UpperArm || part == EBodyPart::Forearm || part == EBodyPart::Thigh ||
+           part == EBodyPart::Shin;
+}
+
+// Whether the motion puts a joint elsewhere than its offset does, as seen from the joint above.
+bool IsMoved(const CNode& joint)
+{
+    constexpr double kSameWay = 0.5; // degrees
+    const CKeyframeControl* const track = TrackOf(joint);
+    const Vec3 rest = RestLocal(joint).Translation();
+    if (!track || track->m_kPositionKeys.empty() || rest == kVec3Zero)
+        return false;
+    const size_t count = track->m_kPositionKeys.size();
+    return std::ranges::any_of(std::array{size_t{0}, count / 2, count - 1}, [&](size_t key) {
+        const Vec3 place = track->m_kPositionKeys[key];
+        return place != kVec3Zero && AngleBetween(place, rest) > kSameWay;
+    });
+}
+
+// Limbs of which the motion moves the joint at the end: their bones lie where it is on the whole.
+void AddMovedLimbs(const CTreePoser& tree, const std::vector<JointRole>& roles, std::vector<LooseWay>& ways)
+{
+    for (size_t i = 0; i < roles.size(); ++i)
+    {
+        CNode* const from = tree.Joints()[i];
+        CNode* const to = roles[i].next;
+        if (IsLimb(roles[i].part) && to && to->GetParentNode() == from && IsMoved(*to))
+            ways.push_back({from, to});
+    }
 }
 
 bool IsFinite(const std::vector<Mat3>& turns)
@@ -130,14 +152,16 @@ void CAlignmentPlanner::LookAtRest()
     const double leg = LegLength(motion_.body);
     alignment_.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
     m_kWays = FindLooseWays(m_kTree, m_kRoles, leg);
+    if (motion_.limbs == ELimbWays::Mean)
+        AddMovedLimbs(m_kTree, m_kRoles, m_kWays);
     const BodyStance stance = RestStanceOf(motion_.body);
     m_kUp = NearestAxis(stance.up);
-    m_bIsRest = IsReference(stance) || motion_.frameCount <= 0;
+    m_bIsRest = stance.IsReference() || motion_.frameCount <= 0;
 }
 
 void CAlignmentPlanner::FindUp()
 {
-    const Vec3 worldUp = FindWorldUp(motion_, m_bIsRest ? std::optional(m_kUp) : std::nullopt);
+    const Vec3 worldUp = FindUpAxis(motion_.body, motion_.frequency, motion_.frameCount);
     m_kUp = m_bIsRest ? m_kUp : worldUp;
     alignment_.worldTurn = LeastSwing(worldUp, kVec3UnitY);
     ReportUp(worldUp, alignment_.report);

@@ -3,7 +3,6 @@
 #include "BodyPose.h"
 #include "CMotionFile.h"
 #include "CPoseSampler.h"
-#include "Directions.h"
 
 namespace gw {
 
@@ -33,14 +32,6 @@ BodyPaths FollowBody(const CMotionFile& motion, const CBodyMap& body)
             paths.feet[static_cast<size_t>(side)].push_back(PlaceOf(*body.Leg(side).foot));
     }
     return paths;
-}
-
-Vec3 FindUpAxis(const BodyPaths& paths)
-{
-    Vec3 sum = kVec3Zero;
-    for (size_t frame = 0; frame < paths.FrameCount(); ++frame)
-        sum = sum + paths.hip[frame] * 2.0f - paths.feet[0][frame] - paths.feet[1][frame];
-    return NearestAxis(sum);
 }
 
 double RestLegLength(const CBodyMap& body)

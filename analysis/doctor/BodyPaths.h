@@ -23,10 +23,6 @@ struct BodyPaths
 /// Returns the paths of a body with a hip and both feet; empty for other bodies. Leaves the tree posed.
 BodyPaths FollowBody(const CMotionFile& motion, const CBodyMap& body);
 
-/// Returns the signed world axis along which the hip is above the feet over the whole motion; +Y for a motion
-/// without frames.
-Vec3 FindUpAxis(const BodyPaths& paths);
-
 /// Returns the length of thigh plus shin in the rest pose, averaged over both legs; 0 if a joint is missing.
 double RestLegLength(const CBodyMap& body);
 

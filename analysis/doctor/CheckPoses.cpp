@@ -13,6 +13,7 @@
 #include "FindBodyByNames.h"
 #include "GaitRate.h"
 #include "Skeleton.h"
+#include "UpAxis.h"
 
 #include <algorithm>
 #include <cmath>
@@ -152,7 +153,7 @@ MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFi
     const BodyPaths paths = FollowBody(motion, found.body);
     if (paths.FrameCount() == 0)
         return facts;
-    const Vec3 up = FindUpAxis(paths);
+    const Vec3 up = FindUpAxis(found.body, motion.GetFrequency(), motion.GetKeyCount());
     facts.up = AxisName(up);
     check.CheckRate(paths, up, facts);
     return facts;

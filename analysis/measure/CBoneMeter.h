@@ -9,28 +9,19 @@ namespace gw {
 
 class CPoseSampler;
 
-/// The direction from one joint to another while frames go by, and how much it shakes.
-class CDirectionMeter
+/// The direction from one joint to another.
+class CBoneDirection
 {
 public:
     /// Without an end it is the direction of the joint's bone: +y of its bone mesh, else of its own.
-    CDirectionMeter(const CNode& joint, const CNode* end) : m_pkJoint(&joint), m_pkEnd(end) {}
+    CBoneDirection(const CNode& joint, const CNode* end) : m_pkJoint(&joint), m_pkEnd(end) {}
 
-    /// Takes the present pose as the next frame.
-    void Add();
-    /// The unit direction of the last frame.
-    const Vec3& Direction() const { return m_kLast; }
-    double Jitter() const { return m_kBends.Mean(); }
-
-private:
+    /// The unit direction in the present pose.
     Vec3 Present() const;
 
+private:
     const CNode* m_pkJoint;
     const CNode* m_pkEnd; // null for an end joint
-    Vec3 m_kLast = kVec3Zero;
-    Vec3 m_kBeforeLast = kVec3Zero;
-    int m_iFrames = 0;
-    CRunningMean m_kBends;
 };
 
 /// One pair of bones while frames go by: both have a direction, or are looked at by their bones' axes.
@@ -48,8 +39,8 @@ public:
     void Write(BoneMeasures& bone) const;
 
 private:
-    CDirectionMeter m_kSource;
-    CDirectionMeter m_kTarget;
+    CBoneDirection m_kSource;
+    CBoneDirection m_kTarget;
     CRunningMean m_kErrors;
     double m_fLastError = 0.0;
     int m_iFrame = 0; // the next one

@@ -35,21 +35,11 @@ PartMeasures MeasurePart(const BodyPart& part, const std::vector<BoneMeasures>& 
     return measures;
 }
 
-// From the first place on in x and z; above a floor in y.
-void MoveToStart(std::vector<Vec3>& places, double floor, double scale)
-{
-    if (places.empty())
-        return;
-    const Vec3 start{places.front().x, static_cast<float>(floor), places.front().z};
-    for (Vec3& place : places)
-        place = (place - start) * static_cast<float>(scale);
-}
-
 } // namespace
 
 CDetailRecorder::CDetailRecorder(ConversionDetail& detail, std::span<const BonePair> pairs,
-                                 const CSourceTable& sources, const CNode* resultRoot)
-    : detail_(detail), m_pkSourceRoot(sources.SourceOf(resultRoot)), m_pkResultRoot(resultRoot)
+                                 const CSourceTable& sources)
+    : detail_(detail)
 {
     for (const BonePair& pair : pairs)
     {
@@ -72,7 +62,7 @@ void CDetailRecorder::AddMainBone(const BonePair& pair, const CSourceTable& sour
     detail_.mainSources.emplace_back(pair.source->NameView());
 }
 
-void CDetailRecorder::AddErrors()
+void CDetailRecorder::Add()
 {
     if (m_kMeters.empty())
         return;
@@ -91,16 +81,7 @@ void CDetailRecorder::AddErrors()
     detail_.largestBone.push_back(static_cast<uint8_t>(largest));
 }
 
-void CDetailRecorder::Add()
-{
-    AddErrors();
-    if (!m_pkSourceRoot)
-        return;
-    detail_.sourceRoot.push_back(m_pkSourceRoot->m_kWorldMatrix.Translation());
-    detail_.resultRoot.push_back(m_pkResultRoot->m_kWorldMatrix.Translation());
-}
-
-void CDetailRecorder::FinishParts()
+void CDetailRecorder::Finish()
 {
     std::vector<BoneMeasures> bones(m_kMeters.size());
     for (size_t i = 0; i < bones.size(); ++i)
@@ -110,19 +91,6 @@ void CDetailRecorder::FinishParts()
     }
     for (const BodyPart& part : BodyParts())
         detail_.parts.push_back(MeasurePart(part, bones));
-}
-
-void CDetailRecorder::Finish(const ConversionMeasures& measures)
-{
-    FinishParts();
-    if (measures.sourceLeg > 0.0 && measures.resultLeg > 0.0)
-    {
-        MoveToStart(detail_.sourceRoot, detail_.sourceFloor, measures.resultLeg / measures.sourceLeg);
-        MoveToStart(detail_.resultRoot, 0.0, 1.0);
-        return;
-    }
-    detail_.sourceRoot.clear();
-    detail_.resultRoot.clear();
 }
 
 } // namespace gw

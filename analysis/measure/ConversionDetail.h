@@ -57,10 +57,12 @@ struct ConversionDetail
     /// below them, as deep as under the result's.
     double sourceFloor = 0.0;
 
-    /// Where the result's root and the bone that drives it are; from the first frame in x and z, above the
-    /// floor in y. Empty where the root or a leg is not mapped.
-    std::vector<Vec3> sourceRoot;
-    std::vector<Vec3> resultRoot;
+    /// Angle between the trunks; see ConversionMeasures::trunkMean. Empty where that is missing.
+    std::vector<float> trunkError;
+    /// Where the middle of the hip joints is; from the first frame in x and z, above the floor in y. Empty
+    /// where no leg is mapped.
+    std::vector<Vec3> sourceHips;
+    std::vector<Vec3> resultHips;
 };
 
 } // namespace gw

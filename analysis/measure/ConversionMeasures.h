@@ -9,9 +9,9 @@ namespace gw {
 
 // What a conversion did to a motion, in figures. Frames are the source's; the result is sampled at the same
 // instants. World space with y up on both sides. Angles are degrees. A length is given in the result's unit
-// (mm) or, where source and result stand side by side, in leg lengths of its own skeleton: thigh to knee to
-// ankle at frame 0, both legs' mean. A ratio is result by source and missing where the source's figure is 0
-// but for rounding.
+// (mm): one of the source is scaled by the ratio of the legs before it is compared, so that lengths are
+// compared in leg lengths. A leg is thigh to knee to ankle at frame 0, both legs' mean. A ratio is result by
+// source and missing where the source's figure is 0 but for rounding.
 
 /// How one mapped bone points. The direction of a bone is that from its joint to the next joint below that is
 /// not at the same place: towards the nearest mapped bone below, else along the branch that goes on farthest.
@@ -31,9 +31,18 @@ struct BoneMeasures
     double meanError = 0.0;    ///< mean over all frames of the angle between the two directions
     double largestError = 0.0; ///< the largest of these angles
     int largestFrame = 0;      ///< where it stands, from 0 on
-    /// Mean over the inner frames of |d(f - 1) - 2 d(f) + d(f + 1)|, d being the unit direction.
-    double sourceJitter = 0.0;
-    double resultJitter = 0.0; ///< the same for the result's bone
+};
+
+/// How far planted joints slide. A plant is an unbroken run of frames in which a joint of the source, the
+/// ankle or the toe, is near the floor and slow, with hysteresis (FindContacts.h). Its slide is the largest
+/// distance over the ground from where it was in the first frame. Added slide is the result's minus the
+/// source's, mm, and negative where the result slides less.
+struct SlideMeasures
+{
+    size_t plants = 0;
+    double median = 0.0;  ///< added slide of the plants
+    double largest = 0.0; ///< the largest one
+    int largestFrame = 0; ///< in which the result's joint is farthest off in that plant
 };
 
 /// What one foot does: an ankle, and a toe joint where there is one. A side's foot stands in a frame when its
@@ -60,33 +69,52 @@ struct FootMeasures
     double soleTiltLargest = 0.0;
     double sourceSoleTiltMean = 0.0; ///< the same of the source's foot
 
-    /// Slide: the largest distance over the ground between the ankle at the start of a contact of the source
-    /// and the ankle later in it. Added slide is the result's minus the source's, in leg lengths, and may be
-    /// negative.
-    double addedSlideMean = 0.0;         ///< mean over the contacts, mm
-    double addedSlideLargest = 0.0;      ///< of one contact, mm
-    int addedSlideFrame = 0;             ///< in which the result's ankle is farthest off in that contact
-    double addedSlideMeanShare = 0.0;    ///< mean, in leg lengths
-    double addedSlideLargestShare = 0.0; ///< largest, in leg lengths
-    double sourceSlideShare = 0.0;       ///< mean slide of the source, in its leg lengths
-    double resultSlideShare = 0.0;       ///< mean slide of the result, in its leg lengths
+    SlideMeasures ankleSlide;
+    SlideMeasures toeSlide; ///< without plants where a side has no toe joint
 
     size_t sourceContacts = 0; ///< number of contacts
     size_t resultContacts = 0; ///< the same in the result
-    size_t sourceStanding = 0; ///< frames in contact
+    /// Frames in contact. Those in which ankle or toe of the source, whichever is faster, moves at 15 to 30
+    /// cm/s do not count: nobody can tell whether such a foot stands.
+    size_t sourceStanding = 0;
     size_t resultStanding = 0; ///< the same in the result
     size_t bothStanding = 0;   ///< frames in which both stand
     /// 2 both / (source + result), in frames: 1 where the same frames stand, missing where none stands.
     std::optional<double> contactF1;
 
-    /// Knee: the angle between thigh and calf, 0 for a straight leg. A pop is a frame into which it changes
-    /// by over 5 degrees more than the source's knee does.
+    /// Held sole: how far the lower end of the result's sole is from the floor, y = 0, above or below, over
+    /// the frames of the source's contacts, mm. A sole is what lies on the floor under ankle and toe in the
+    /// rest pose (RestFloor).
+    double heldSole = 0.0; ///< 95th percentile
+    double heldSoleLargest = 0.0;
+    int heldSoleFrame = 0; ///< the frame of the largest
+
+    /// Knee: the angle between thigh and calf, 0 for a straight leg. A pop is a run of frames in which it
+    /// changes within 1/30 s by over 5 degrees more than the source's largest change within 1/30 s, from 1/15
+    /// s before to 1/15 s behind.
     size_t kneePops = 0;
-    std::vector<int> kneePopFrames; ///< which these are
+    std::vector<int> kneePopFrames; ///< the worst frame of each
     int kneePopFrame = 0;           ///< the frame of the next figure
-    double kneePopLargest = 0.0; ///< most by which the change of one frame exceeds the source's; at least 0
-    double kneeChangeLargest = 0.0; ///< largest change from one frame to the next
-    double sourceKneeChangeLargest = 0.0;
+    double kneePopLargest = 0.0;    ///< most by which a change exceeds the source's; at least 0
+};
+
+/// What one hand does: the hand's joint, the wrist. It touches a thigh, the torso, the head, the other hand
+/// or the floor in a frame in which the source's is within 50 mm of where it would lie on it.
+struct HandMeasures
+{
+    std::string target; ///< hand of the result
+    std::string source; ///< what drives it
+
+    size_t touchFrames = 0; ///< in which the source's hand touches anything
+    /// How much farther from a touched part, or nearer to it, the result's hand is than the source's, mm: the
+    /// 95th percentile over the frames of the touch, of the part for which that is the most; missing where
+    /// nothing is touched for 0.08 s.
+    std::optional<double> gap;
+    std::string gapPart;     ///< "thigh", "torso", "head", "other hand" or "floor"
+    double gapLargest = 0.0; ///< largest of one frame, for that part
+    int gapFrame = 0;
+    double depth = 0.0; ///< how deep the result's hand is below y = 0 at most, mm
+    int depthFrame = 0;
 };
 
 /// All figures of one conversion.
@@ -101,27 +129,36 @@ struct ConversionMeasures
     double meanError = 0.0;          ///< mean over all measured bones and frames
     double largestError = 0.0;       ///< largest of all
 
-    double sourceJitter = 0.0; ///< mean over the measured bones
-    double resultJitter = 0.0;
-    std::optional<double> jitterRatio;
+    /// Between source and result, the angle of the line from the middle of the hip joints to the neck, less
+    /// the difference of the rest poses (MeasureTrunk.h). Missing without a mapped leg or neck.
+    std::optional<double> trunkMean;
+    std::optional<double> trunkMost; ///< 95th percentile
+    int trunkFrame = 0;              ///< the frame of the next figure
+    double trunkLargest = 0.0;
+
+    /// Jitter of the directions of thighs and calves at 30 Hz (LegJitter.h), the result's by the source's.
+    std::optional<double> jitterRatio;        ///< median over these bones
+    std::optional<double> jitterRatioLargest; ///< of one bone
 
     std::vector<FootMeasures> feet; ///< those of LFoot and RFoot that are mapped
-    /// 2 both / (source + result) over all feet.
-    std::optional<double> contactF1;
-
-    /// Where the result stands, against y = 0, mm: the median of a sole's height over the frames of the
-    /// result's contacts, missing where it never stands. A sole is what lies on the floor under ankle and toe
-    /// in the rest pose (RestFloor), and its height is that of its lower end.
-    std::optional<double> floorHeight;
+    SlideMeasures ankleSlide;       ///< over the plants of all feet
+    SlideMeasures toeSlide;
+    std::optional<double> contactF1; ///< over all feet
+    std::optional<double> heldSole;  ///< over the contacts of all feet; missing where the source never stands
     /// 95th percentile over all frames of the depth of the lowest sole below y = 0, mm; 0 where it is not
     /// below.
     double sinkDepth = 0.0;
 
-    /// Path over the ground (x and z) of the result's root and of its source bone, summed over the frames, in
-    /// leg lengths; 0 where the root is not mapped.
+    std::vector<HandMeasures> hands; ///< those of LHand and RHand that are mapped, where a leg is
+    std::optional<double> handGap;   ///< the larger one of the hands
+    std::optional<double> handDepth; ///< the larger one; missing without hands
+
+    /// Path over the ground (x and z) of the middle of the hip joints, summed over the frames, in leg
+    /// lengths; 0 without a mapped leg.
     double sourceTravel = 0.0;
     double resultTravel = 0.0;
-    std::optional<double> travelRatio;
+    std::optional<double>
+        travelRatio; ///< missing where the source's path is below 50 cm in the result's size
 };
 
 } // namespace gw

@@ -1,13 +1,13 @@
 // How a conversion is measured: which joints are looked at is found once, in the pose of the first frame;
 // then both trees are posed frame by frame, the looked-at joints alone, and each meter takes what it needs.
-// Bones keep running sums. Feet keep a few numbers a frame, since where the floor is, and with it which
-// frames stand, is known at the end only.
+// Bones keep running sums. The body keeps a few joints a frame, since where the floor is, and with it which
+// frames stand and what hands touch, is known at the end only.
 
 #include "MeasureConversion.h"
 
+#include "CBodyMeter.h"
 #include "CBoneMeter.h"
 #include "CDetailRecorder.h"
-#include "CFeetMeter.h"
 #include "CMotionFile.h"
 #include "CPoseSampler.h"
 #include "FrameScale.h"
@@ -20,50 +20,6 @@ namespace gw {
 namespace {
 
 constexpr double kUsualSecondsPerFrame = 1.0 / 30.0; // where a file gives no usable one
-// A motion that stands still has these by rounding alone: unit directions are good to 1e-7, positions to as
-// much of their distance from the origin, over thousands of frames.
-constexpr double kStillJitter = 1e-6;
-constexpr double kStillTravel = 1e-3;
-
-// The path of a root and of what drives it, over the ground, in the units of each side.
-class CTravelMeter
-{
-public:
-    CTravelMeter(const CNode* source, const CNode* result) : m_pkSource(source), m_pkResult(result) {}
-
-    void Add()
-    {
-        if (!m_pkSource)
-            return;
-        const Vec3 source = m_pkSource->m_kWorldMatrix.Translation();
-        const Vec3 result = m_pkResult->m_kWorldMatrix.Translation();
-        if (m_bBegun)
-        {
-            m_kSourceSteps.Add(GroundDistance(m_kLastSource, source));
-            m_kResultSteps.Add(GroundDistance(m_kLastResult, result));
-        }
-        m_kLastSource = source;
-        m_kLastResult = result;
-        m_bBegun = true;
-    }
-    void Write(ConversionMeasures& measures) const
-    {
-        if (measures.sourceLeg <= 0.0 || measures.resultLeg <= 0.0)
-            return;
-        measures.sourceTravel = m_kSourceSteps.Sum() / measures.sourceLeg;
-        measures.resultTravel = m_kResultSteps.Sum() / measures.resultLeg;
-        measures.travelRatio = RatioOf(measures.resultTravel, measures.sourceTravel, kStillTravel);
-    }
-
-private:
-    const CNode* m_pkSource;
-    const CNode* m_pkResult;
-    Vec3 m_kLastSource = kVec3Zero;
-    Vec3 m_kLastResult = kVec3Zero;
-    CRunningMean m_kSourceSteps;
-    CRunningMean m_kResultSteps;
-    bool m_bBegun = false;
-};
 
 BoneMeasures NamedBone(const BonePair& pair, const BoneEnds& ends)
 {
@@ -99,8 +55,7 @@ private:
     std::vector<BoneMeasures> m_kBones;
     std::vector<CBoneMeter> m_kMeters;   // of the bones that can be measured
     std::vector<size_t> m_kMeteredBones; // which these are
-    CFeetMeter m_kFeet;
-    CTravelMeter m_kTravel;
+    CBodyMeter m_kBody;
     ConversionDetail* m_pkDetail; // null where nobody asks
     std::optional<CDetailRecorder> recorder_;
 };
@@ -110,17 +65,16 @@ CComparison::CComparison(const MotionClip& source, const MotionClip& result, std
     : m_fFrameScale(FrameScaleOf(source.frameCount, result.frameCount)),
       m_fSecondsPerFrame(IsFrameTime(source.frequency) ? source.frequency : kUsualSecondsPerFrame),
       m_iFrameCount(ComparedFrames(source.frameCount, result.frameCount, m_fFrameScale)), m_kSources(pairs),
-      m_kSource(source.frequency), m_kResult(result.frequency), m_kFeet(FindLegs(pairs, m_kSources)),
-      m_kTravel(m_kSources.SourceOf(result.root), result.root), m_pkDetail(detail)
+      m_kSource(source.frequency), m_kResult(result.frequency), m_kBody(pairs, m_kSources), m_pkDetail(detail)
 {
     PlanBones(pairs);
-    m_kFeet.WatchJoints(m_kSource, m_kResult);
-    m_kFeet.Begin();
+    m_kBody.WatchJoints(m_kSource, m_kResult);
+    m_kBody.Begin();
     if (!detail)
         return;
     *detail = {};
     detail->secondsPerFrame = m_fSecondsPerFrame;
-    recorder_.emplace(*detail, pairs, m_kSources, result.root);
+    recorder_.emplace(*detail, pairs, m_kSources);
 }
 
 void CComparison::PlanBones(std::span<const BonePair> pairs)
@@ -153,8 +107,7 @@ void CComparison::Run()
         m_kResult.Pose(frame * m_fFrameScale);
         for (CBoneMeter& meter : m_kMeters)
             meter.Add();
-        m_kFeet.Add();
-        m_kTravel.Add();
+        m_kBody.Add();
         if (recorder_)
             recorder_->Add();
     }
@@ -164,21 +117,14 @@ void CComparison::WriteBones(ConversionMeasures& measures) const
 {
     measures.bones = m_kBones;
     CRunningMean errors;
-    CRunningMean sourceJitter;
-    CRunningMean resultJitter;
     for (size_t i = 0; i < m_kMeters.size(); ++i)
     {
         BoneMeasures& bone = measures.bones[m_kMeteredBones[i]];
         m_kMeters[i].Write(bone);
         errors.Add(bone.meanError);
-        sourceJitter.Add(bone.sourceJitter);
-        resultJitter.Add(bone.resultJitter);
         measures.largestError = std::max(measures.largestError, bone.largestError);
     }
     measures.meanError = errors.Mean();
-    measures.sourceJitter = sourceJitter.Mean();
-    measures.resultJitter = resultJitter.Mean();
-    measures.jitterRatio = RatioOf(measures.resultJitter, measures.sourceJitter, kStillJitter);
 }
 
 ConversionMeasures CComparison::Measures()
@@ -187,10 +133,9 @@ ConversionMeasures CComparison::Measures()
     measures.frameCount = m_iFrameCount;
     measures.frameScale = m_fFrameScale;
     WriteBones(measures);
-    m_kFeet.Write(measures, m_fSecondsPerFrame, m_pkDetail);
-    m_kTravel.Write(measures);
+    m_kBody.Write(measures, m_fSecondsPerFrame, m_pkDetail);
     if (recorder_)
-        recorder_->Finish(measures);
+        recorder_->Finish();
     return measures;
 }
 

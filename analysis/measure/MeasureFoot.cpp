@@ -3,9 +3,10 @@
 #include "Angles.h"
 #include "CLegTrack.h"
 #include "Figures.h"
+#include "Series.h"
 
+#include <algorithm>
 #include <cmath>
-#include <numeric>
 
 namespace gw {
 
@@ -13,6 +14,12 @@ namespace {
 
 constexpr double kFlatEnough = 0.5; // a foot within 30 degrees of upright has no heading worth the name
 constexpr double kPopDegrees = 5.0; // what the eye takes for a jerk, in a walk as in a run
+constexpr double kPopSeconds = 1.0 / 30.0;
+constexpr double kPopSlack = 1.0 / 15.0; // the source's knee may bend so much earlier or later
+// Between these speeds a foot stands by one rule and does not by another, mm/s.
+constexpr double kSurelyStands = 150.0;
+constexpr double kSurelyMoves = 300.0;
+constexpr double kHalfSpeedSeconds = 1.0 / 60.0; // speeds are taken over twice as long
 
 std::vector<bool> StandingFrames(const std::vector<Contact>& contacts, size_t frameCount)
 {
@@ -38,7 +45,7 @@ double TurnBetween(const Vec3& from, const Vec3& to)
 
 void MeasureTurn(const FootSide& source, const FootSide& result, FootMeasures& foot)
 {
-    const std::vector<bool> stands = StandingFrames(source.contacts, source.track.Postures().size());
+    const std::vector<bool> stands = StandingFrames(source.plants.foot, source.track.Postures().size());
     CRunningMean turns;
     CRunningMean errors;
     CRunningMean standing;
@@ -74,66 +81,73 @@ CRunningMean SoleTilts(const CLegTrack& track, const std::vector<Contact>& conta
 
 void MeasureSoles(const FootSide& source, const FootSide& result, FootMeasures& foot)
 {
-    const CRunningMean tilts = SoleTilts(result.track, source.contacts);
+    const CRunningMean tilts = SoleTilts(result.track, source.plants.foot);
     foot.soleTiltMean = tilts.Mean();
     foot.soleTiltLargest = tilts.Largest();
-    foot.sourceSoleTiltMean = SoleTilts(source.track, source.contacts).Mean();
+    foot.sourceSoleTiltMean = SoleTilts(source.track, source.plants.foot).Mean();
 }
 
-struct Slide
+PlantSlide SlideIn(const std::vector<Vec3>& places, const Contact& plant, double scale)
 {
-    double share = 0.0; // in leg lengths
-    int frame = 0;
-};
-
-// How far the ankle goes from where a contact begins.
-Slide SlideIn(const FootSide& side, const Contact& contact)
-{
-    const std::vector<Vec3>& ankles = side.track.Ankles();
-    Slide slide{0.0, contact.first};
-    for (int f = contact.first; f < contact.end; ++f)
+    PlantSlide slide{0.0, plant.first};
+    for (int f = plant.first; f < plant.end; ++f)
     {
         const double distance =
-            GroundDistance(ankles[static_cast<size_t>(contact.first)], ankles[static_cast<size_t>(f)]);
-        if (distance / side.leg > slide.share)
-            slide = {distance / side.leg, f};
+            GroundDistance(places[static_cast<size_t>(plant.first)], places[static_cast<size_t>(f)]) * scale;
+        if (distance > slide.added)
+            slide = {distance, f};
     }
     return slide;
 }
 
-void MeasureSlide(const FootSide& source, const FootSide& result, FootMeasures& foot)
+std::vector<PlantSlide> AddedSlides(const FootSide& source, const FootSide& result,
+                                    const std::vector<Contact>& plants,
+                                    const std::vector<Vec3>& (CLegTrack::*joint)() const)
 {
-    CRunningMean sourceSlides;
-    CRunningMean resultSlides;
-    CRunningMean added;
-    for (const Contact& contact : source.contacts)
+    std::vector<PlantSlide> slides;
+    for (const Contact& plant : plants)
     {
-        const double sourceSlide = SlideIn(source, contact).share;
-        const Slide resultSlide = SlideIn(result, contact);
-        const double addedSlide = resultSlide.share - sourceSlide;
-        if (added.Count() == 0 || addedSlide > added.Largest())
-            foot.addedSlideFrame = resultSlide.frame;
-        sourceSlides.Add(sourceSlide);
-        resultSlides.Add(resultSlide.share);
-        added.Add(addedSlide);
+        const PlantSlide of = SlideIn((source.track.*joint)(), plant, source.scale);
+        PlantSlide slide = SlideIn((result.track.*joint)(), plant, result.scale);
+        slide.added -= of.added;
+        slides.push_back(slide);
     }
-    foot.sourceSlideShare = sourceSlides.Mean();
-    foot.resultSlideShare = resultSlides.Mean();
-    foot.addedSlideMeanShare = added.Mean();
-    foot.addedSlideLargestShare = added.Largest();
-    foot.addedSlideMean = added.Mean() * result.leg;
-    foot.addedSlideLargest = added.Largest() * result.leg;
+    return slides;
 }
 
-void MeasureContacts(const FootSide& source, const FootSide& result, FootMeasures& foot)
+// How fast the faster joint of a foot is, frame by frame, in mm of the result per second.
+std::vector<double> SpeedsOf(const FootSide& side, double secondsPerFrame)
 {
-    const size_t frameCount = source.track.Postures().size();
-    const std::vector<bool> sourceStands = StandingFrames(source.contacts, frameCount);
-    const std::vector<bool> resultStands = StandingFrames(result.contacts, frameCount);
-    foot.sourceContacts = source.contacts.size();
-    foot.resultContacts = result.contacts.size();
-    for (size_t f = 0; f < frameCount; ++f)
+    const int span = FramesIn(kHalfSpeedSeconds, secondsPerFrame);
+    std::vector<double> speeds(side.track.Postures().size());
+    for (const std::vector<Vec3>* joint : {&side.track.Ankles(), &side.track.Toes()})
     {
+        const int last = static_cast<int>(joint->size()) - 1;
+        for (int f = 0; f <= last; ++f)
+        {
+            const int before = std::max(f - span, 0);
+            const int after = std::min(f + span, last);
+            const Vec3 way = (*joint)[static_cast<size_t>(after)] - (*joint)[static_cast<size_t>(before)];
+            double& speed = speeds[static_cast<size_t>(f)];
+            speed = std::max(speed,
+                             Vec3Length(way) * side.scale / (secondsPerFrame * std::max(after - before, 1)));
+        }
+    }
+    return speeds;
+}
+
+void MeasureContacts(const FootSide& source, const FootSide& result, double secondsPerFrame,
+                     FootMeasures& foot)
+{
+    const std::vector<double> speeds = SpeedsOf(source, secondsPerFrame);
+    const std::vector<bool> sourceStands = StandingFrames(source.plants.foot, speeds.size());
+    const std::vector<bool> resultStands = StandingFrames(result.plants.foot, speeds.size());
+    foot.sourceContacts = source.plants.foot.size();
+    foot.resultContacts = result.plants.foot.size();
+    for (size_t f = 0; f < speeds.size(); ++f)
+    {
+        if (speeds[f] >= kSurelyStands && speeds[f] <= kSurelyMoves)
+            continue;
         foot.sourceStanding += sourceStands[f] ? 1 : 0;
         foot.resultStanding += resultStands[f] ? 1 : 0;
         foot.bothStanding += sourceStands[f] && resultStands[f] ? 1 : 0;
@@ -142,40 +156,95 @@ void MeasureContacts(const FootSide& source, const FootSide& result, FootMeasure
                              static_cast<double>(foot.sourceStanding + foot.resultStanding));
 }
 
-void MeasureKnee(const FootSide& source, const FootSide& result, FootMeasures& foot)
+void MeasureHeldSoles(const FootSide& source, const FootSide& result, MeasuredFoot& foot)
 {
-    const auto change = [](const FootSide& side, size_t f) {
-        const auto& postures = side.track.Postures();
-        return std::fabs(static_cast<double>(postures[f].kneeAngle - postures[f - 1].kneeAngle));
-    };
-    for (size_t f = 1; f < source.track.Postures().size(); ++f)
+    for (const Contact& contact : source.plants.foot)
     {
-        const double sourceChange = change(source, f);
-        const double resultChange = change(result, f);
-        if (resultChange - sourceChange > kPopDegrees)
-            foot.kneePopFrames.push_back(static_cast<int>(f));
-        if (resultChange - sourceChange > foot.kneePopLargest)
+        for (int f = contact.first; f < contact.end; ++f)
         {
-            foot.kneePopLargest = resultChange - sourceChange;
-            foot.kneePopFrame = static_cast<int>(f);
+            const float height = result.track.Postures()[static_cast<size_t>(f)].soleHeight;
+            const double away = std::fabs(static_cast<double>(height)) * result.scale;
+            foot.heldSoles.push_back(static_cast<float>(away));
+            if (!std::isfinite(away) || away <= foot.figures.heldSoleLargest)
+                continue;
+            foot.figures.heldSoleLargest = away;
+            foot.figures.heldSoleFrame = f;
         }
-        foot.kneeChangeLargest = std::max(foot.kneeChangeLargest, resultChange);
-        foot.sourceKneeChangeLargest = std::max(foot.sourceKneeChangeLargest, sourceChange);
+    }
+    foot.figures.heldSole = static_cast<double>(Percentile(foot.heldSoles, kMostShare));
+}
+
+std::vector<float> KneeAngles(const CLegTrack& track)
+{
+    std::vector<float> angles;
+    angles.reserve(track.Postures().size());
+    for (const CLegTrack::Posture& posture : track.Postures())
+        angles.push_back(posture.kneeAngle);
+    return angles;
+}
+
+void MeasureKnee(const FootSide& source, const FootSide& result, double secondsPerFrame, FootMeasures& foot)
+{
+    const int span = FramesIn(kPopSeconds, secondsPerFrame);
+    const int slack = FramesIn(kPopSlack, secondsPerFrame);
+    const std::vector<float> changes = LargestChanges(KneeAngles(result.track), span);
+    const std::vector<float> allowed =
+        SlidingLargest(LargestChanges(KneeAngles(source.track), span), slack, slack);
+    bool pops = false;
+    double worst = 0.0; // of the present pop
+    for (size_t f = 0; f < changes.size(); ++f)
+    {
+        const auto excess = static_cast<double>(changes[f] - allowed[f]);
+        const auto frame = static_cast<int>(f);
+        if (excess > foot.kneePopLargest)
+        {
+            foot.kneePopLargest = excess;
+            foot.kneePopFrame = frame;
+        }
+        const bool popped = pops;
+        pops = excess > kPopDegrees;
+        if (pops && !popped)
+            foot.kneePopFrames.push_back(frame);
+        else if (pops && excess > worst)
+            foot.kneePopFrames.back() = frame;
+        worst = pops && popped ? std::max(worst, excess) : excess;
     }
     foot.kneePops = foot.kneePopFrames.size();
 }
 
 } // namespace
 
-FootMeasures MeasureFoot(const FootSide& source, const FootSide& result)
+MeasuredFoot MeasureFoot(const FootSide& source, const FootSide& result, double secondsPerFrame)
 {
-    FootMeasures foot;
-    MeasureTurn(source, result, foot);
-    MeasureSoles(source, result, foot);
-    MeasureSlide(source, result, foot);
-    MeasureContacts(source, result, foot);
-    MeasureKnee(source, result, foot);
+    MeasuredFoot foot;
+    MeasureTurn(source, result, foot.figures);
+    MeasureSoles(source, result, foot.figures);
+    foot.ankleSlides = AddedSlides(source, result, source.plants.ankle, &CLegTrack::Ankles);
+    if (result.track.HasToe())
+        foot.toeSlides = AddedSlides(source, result, source.plants.toe, &CLegTrack::Toes);
+    foot.figures.ankleSlide = SummaryOf(foot.ankleSlides);
+    foot.figures.toeSlide = SummaryOf(foot.toeSlides);
+    MeasureContacts(source, result, secondsPerFrame, foot.figures);
+    MeasureHeldSoles(source, result, foot);
+    MeasureKnee(source, result, secondsPerFrame, foot.figures);
     return foot;
+}
+
+SlideMeasures SummaryOf(const std::vector<PlantSlide>& slides)
+{
+    SlideMeasures summary;
+    summary.plants = slides.size();
+    std::vector<float> added;
+    for (const PlantSlide& slide : slides)
+    {
+        added.push_back(static_cast<float>(slide.added));
+        if (added.size() > 1 && !(slide.added > summary.largest))
+            continue;
+        summary.largest = std::isfinite(slide.added) ? slide.added : 0.0;
+        summary.largestFrame = slide.frame;
+    }
+    summary.median = Median(std::move(added));
+    return summary;
 }
 
 } // namespace gw

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "ConversionMeasures.h"
-#include "FindContacts.h"
+#include "FindPlants.h"
 
 #include <vector>
 
@@ -13,11 +13,30 @@ class CLegTrack;
 struct FootSide
 {
     const CLegTrack& track;
-    const std::vector<Contact>& contacts;
-    double leg; ///< length, in the unit of the track
+    const FootPlants& plants;
+    double scale; ///< the result's unit by that of the track
 };
 
-/// All figures of a foot but its names. Both tracks have the same frames.
-FootMeasures MeasureFoot(const FootSide& source, const FootSide& result);
+/// A joint's slide in a plant.
+struct PlantSlide
+{
+    double added; ///< mm; see SlideMeasures
+    int frame;    ///< in which the result's joint is farthest off
+};
+
+/// Everything about a foot but its names.
+struct MeasuredFoot
+{
+    FootMeasures figures;
+    std::vector<PlantSlide> ankleSlides; ///< one for each plant
+    std::vector<PlantSlide> toeSlides;
+    std::vector<float> heldSoles; ///< see FootMeasures::heldSole; one for each frame that the source stands
+};
+
+/// Both tracks have the same frames.
+MeasuredFoot MeasureFoot(const FootSide& source, const FootSide& result, double secondsPerFrame);
+
+/// The figures of some plants.
+SlideMeasures SummaryOf(const std::vector<PlantSlide>& slides);
 
 } // namespace gw

@@ -1,5 +1,7 @@
 #include "WorstFrames.h"
 
+#include "HostBones.h"
+
 #include <algorithm>
 #include <cmath>
 #include <cstdlib>
@@ -10,12 +12,33 @@ namespace {
 
 constexpr double kSecondsApart = 0.5;
 
+// What the eye lets pass in a single frame, by EFrameFault: degrees, mm.
+constexpr double kPassing[] = {
+    5.0,  // Direction
+    5.0,  // Trunk
+    5.0,  // KneePop
+    15.0, // AnkleSlide
+    15.0, // ToeSlide
+    15.0, // HeldSole: a foot that lands or leaves is off the floor by a little
+    30.0, // HandGap
+    20.0, // HandDepth
+};
+
+double SeverityOf(const WorstFrame& worst)
+{
+    return worst.amount / kPassing[static_cast<size_t>(worst.fault)];
+}
+
 WorstFrame DirectionFault(const ConversionDetail& detail, size_t frame)
 {
     const size_t bone = detail.largestBone[frame];
-    return {
-        EFrameFault::Direction, static_cast<int>(frame),  static_cast<double>(detail.meanError[frame]),
-        detail.mainBones[bone], detail.mainSources[bone], static_cast<double>(detail.largestError[frame])};
+    return {EFrameFault::Direction,
+            static_cast<int>(frame),
+            static_cast<double>(detail.meanError[frame]),
+            detail.mainBones[bone],
+            detail.mainSources[bone],
+            static_cast<double>(detail.largestError[frame]),
+            {}};
 }
 
 // Adds the frame of the largest direction error that is far enough from all that stand. False where there is
@@ -44,20 +67,63 @@ bool AddNextDirection(const ConversionDetail& detail, std::vector<WorstFrame>& w
     return true;
 }
 
-void AddWorstPop(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>& worst)
+void AddDirection(const ConversionDetail& detail, std::vector<WorstFrame>& worst)
 {
-    const auto foot = std::ranges::max_element(feet, {}, &FootMeasures::kneePopLargest);
-    if (foot != feet.end() && foot->kneePops > 0)
-        worst.push_back(
-            {EFrameFault::KneePop, foot->kneePopFrame, foot->kneePopLargest, foot->target, foot->source});
+    const auto largest = std::ranges::max_element(detail.meanError);
+    if (largest != detail.meanError.end())
+        worst.push_back(DirectionFault(detail, static_cast<size_t>(largest - detail.meanError.begin())));
 }
 
-void AddWorstSlide(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>& worst)
+void AddTrunk(const ConversionMeasures& measures, std::vector<WorstFrame>& worst)
 {
-    const auto foot = std::ranges::max_element(feet, {}, &FootMeasures::addedSlideLargest);
-    if (foot != feet.end() && foot->addedSlideLargest >= kNamedSlide)
+    for (const BoneMeasures& bone : measures.bones)
+    {
+        if (bone.target == kNeckBone && measures.trunkMean)
+            worst.push_back({EFrameFault::Trunk,
+                             measures.trunkFrame,
+                             measures.trunkLargest,
+                             bone.target,
+                             bone.source,
+                             0.0,
+                             {}});
+    }
+}
+
+void AddFeet(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>& worst)
+{
+    for (const FootMeasures& foot : feet)
+    {
+        const auto add = [&](EFrameFault fault, int frame, double amount) {
+            worst.push_back({fault, frame, amount, foot.target, foot.source, 0.0, {}});
+        };
+        add(EFrameFault::KneePop, foot.kneePopFrame, foot.kneePopLargest);
+        add(EFrameFault::AnkleSlide, foot.ankleSlide.largestFrame, foot.ankleSlide.largest);
+        add(EFrameFault::ToeSlide, foot.toeSlide.largestFrame, foot.toeSlide.largest);
+        add(EFrameFault::HeldSole, foot.heldSoleFrame, foot.heldSoleLargest);
+    }
+}
+
+void AddHands(const std::vector<HandMeasures>& hands, std::vector<WorstFrame>& worst)
+{
+    for (const HandMeasures& hand : hands)
+    {
+        worst.push_back({EFrameFault::HandGap, hand.gapFrame, hand.gapLargest, hand.target, hand.source, 0.0,
+                         hand.gapPart});
         worst.push_back(
-            {EFrameFault::Slide, foot->addedSlideFrame, foot->addedSlideLargest, foot->target, foot->source});
+            {EFrameFault::HandDepth, hand.depthFrame, hand.depth, hand.target, hand.source, 0.0, {}});
+    }
+}
+
+// Of two sides with one fault, the worse one is left.
+void KeepWorstOfEach(std::vector<WorstFrame>& worst)
+{
+    std::vector<WorstFrame> kept;
+    for (WorstFrame& frame : worst)
+    {
+        if (std::ranges::count(kept, frame.fault, &WorstFrame::fault) == 0)
+            kept.push_back(std::move(frame));
+    }
+    worst = std::move(kept);
 }
 
 } // namespace
@@ -66,9 +132,13 @@ std::vector<WorstFrame> FindWorstFrames(const ConversionMeasures& measures, cons
                                         size_t count)
 {
     std::vector<WorstFrame> worst;
-    AddNextDirection(detail, worst);
-    AddWorstPop(measures.feet, worst);
-    AddWorstSlide(measures.feet, worst);
+    AddDirection(detail, worst);
+    AddTrunk(measures, worst);
+    AddFeet(measures.feet, worst);
+    AddHands(measures.hands, worst);
+    std::erase_if(worst, [](const WorstFrame& frame) { return !(SeverityOf(frame) > 1.0); });
+    std::ranges::stable_sort(worst, std::ranges::greater(), SeverityOf);
+    KeepWorstOfEach(worst);
     worst.resize(std::min(worst.size(), count));
     while (worst.size() < count && AddNextDirection(detail, worst))
     {

@@ -40,9 +40,10 @@ std::string CConversionPage::Head() const
     else
         page.Integer(static_cast<long long>(m_kRows.size())).Raw(" motions");
     page.Raw(": conversion report</title>\n<style>\n").Raw(kPageStyle).Raw("</style>\n</head>\n<body>\n");
-    page.Raw("<h1>Conversion report</h1>\n<p class=\"about\">The result compared with the source, at every frame "
-             "of the source, starting at 0. Lengths are millimeters of the result; the source is scaled to "
-             "the result's leg length.</p>\n");
+    page.Raw(
+        "<h1>Conversion report</h1>\n<p class=\"about\">The result compared with the source, at every frame "
+        "of the source, starting at 0. Lengths are millimeters of the result; the source is scaled to "
+        "the result's leg length.</p>\n");
     if (m_kRows.size() > 1 || m_uiSections == 0)
         AppendSummary(page);
     return page.Text();
@@ -67,11 +68,21 @@ void CConversionPage::AppendSummary(CMarkup& page) const
     page.Raw("</p>\n");
 }
 
+std::string CConversionPage::Foot()
+{
+    CMarkup page;
+    page.Raw("<h2>What the figures mean</h2>\n<dl>\n");
+    for (const KeyFigure& figure : KeyFiguresOf({}, {}))
+        page.Raw("<dt>").Raw(figure.label).Raw("</dt><dd>").Raw(figure.meaning).Raw("</dd>\n");
+    page.Raw("</dl>\n</body>\n</html>\n");
+    return page.Text();
+}
+
 bool CConversionPage::Write(const std::string& path)
 {
     CSafeFile file;
-    return file.Open(path) && file.Write(Head()) && m_kSections.CopyTo(file) &&
-           file.Write(std::string_view("</body>\n</html>\n")) && file.Commit();
+    return file.Open(path) && file.Write(Head()) && m_kSections.CopyTo(file) && file.Write(Foot()) &&
+           file.Commit();
 }
 
 } // namespace gw

@@ -36,6 +36,7 @@ private:
     };
 
     std::string Head() const;
+    static std::string Foot();
     void AppendSummary(CMarkup& page) const;
 
     std::vector<Row> m_kRows;

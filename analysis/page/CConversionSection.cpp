@@ -21,23 +21,38 @@ std::vector<std::string> NamesOf(const std::vector<BoneMeasures>& bones, std::st
     return names;
 }
 
+// What a fault's sentence says around its amount. Without a beginning the sentence begins with the amount.
+struct FaultSentence
+{
+    std::string_view before; // ahead of the bone's name
+    std::string_view after;  // between name and amount
+    std::string_view end;
+};
+
+// By EFrameFault; a direction has two amounts.
+constexpr FaultSentence kFaults[] = {
+    {"",                       "",                             ""                                     },
+    {"the line from hips to ", " leans ",                      "° away from the source's"            },
+    {"the knee above ",        " jumps by ",                   "° more than in the source"           },
+    {"",                       " is planted but slides ",      " mm farther than in the source"       },
+    {"the toe of ",            " is planted but slides ",      " mm farther than in the source"       },
+    {"",                       " is planted but its sole is ", " mm off the floor"                    },
+    {"",                       " is ",                         " mm off what it touches in the source"},
+    {"",                       " is ",                         " mm below the floor"                  },
+};
+
 void AppendFault(CMarkup& page, const WorstFrame& worst)
 {
-    switch (worst.fault)
+    if (worst.fault == EFrameFault::Direction)
     {
-    case EFrameFault::Direction:
         page.Raw("mean error of the main bones ").Number(worst.amount, 1).Raw("°, largest at ");
         page.Name(worst.target).Raw(", ").Number(worst.most, 1).Raw("°");
-        break;
-    case EFrameFault::KneePop:
-        page.Raw("the knee above ").Name(worst.target).Raw(" jumps by ").Number(worst.amount, 1);
-        page.Raw("° more than in the source");
-        break;
-    case EFrameFault::Slide:
-        page.Name(worst.target).Raw(" is planted but slides ").Number(worst.amount, 1);
-        page.Raw(" mm farther than in the source");
-        break;
+        return;
     }
+    const FaultSentence& words = kFaults[static_cast<size_t>(worst.fault)];
+    page.Raw(words.before).Name(worst.target).Raw(words.after).Number(worst.amount, 1).Raw(words.end);
+    if (!worst.part.empty())
+        page.Raw(": ").Raw(worst.part);
 }
 
 // The size of the source for pictures; without legs on both sides it stands as large as it is.
@@ -79,7 +94,7 @@ void CConversionSection::Append(CMarkup& page, const std::string& anchor)
     AppendCurves(page);
     page.Raw("</div>\n<h3>Measurements</h3>\n<div class=\"tables\">\n<div>\n");
     AppendPartTable(page, *motion_.measured, motion_.plain);
-    AppendFootTable(page, *motion_.measured);
+    AppendFeetAndHands(page, *motion_.measured);
     page.Raw("</div>\n");
     AppendBoneTable(page, *motion_.measured, motion_.plain);
     page.Raw("</div>\n</section>\n");
@@ -156,12 +171,16 @@ void CConversionSection::AppendCurves(CMarkup& page) const
     chart.curves.push_back({"worst main bone", "most", detail.largestError});
     chart.curves.push_back({"mean of main bones", "result", detail.meanError});
     AppendChart(page, chart, m_uiMostPoints);
-    AppendRootHeight(page);
+    Chart trunk = NewChart("Trunk error", "°");
+    trunk.fromZero = true;
+    trunk.curves.push_back({"hips to neck", "result", detail.trunkError});
+    AppendChart(page, trunk, m_uiMostPoints);
+    AppendHipHeight(page);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendKnee(page, detail.feet[i], motion_.measured->sums.feet[i].target);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendSole(page, detail.feet[i], motion_.measured->sums.feet[i].target);
-    AppendPaths(page, detail.sourceRoot, detail.resultRoot, m_uiMostPoints);
+    AppendPaths(page, detail.sourceHips, detail.resultHips, m_uiMostPoints);
 }
 
 Chart CConversionSection::NewChart(const std::string& title, std::string_view unit) const
@@ -191,12 +210,12 @@ void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const
     AppendChart(page, chart, m_uiMostPoints);
 }
 
-void CConversionSection::AppendRootHeight(CMarkup& page) const
+void CConversionSection::AppendHipHeight(CMarkup& page) const
 {
     const ConversionDetail& detail = motion_.measured->detail;
-    const std::vector<float> source = Heights(detail.sourceRoot);
-    const std::vector<float> result = Heights(detail.resultRoot);
-    Chart chart = NewChart("Height of the root", "mm above the floor");
+    const std::vector<float> source = Heights(detail.sourceHips);
+    const std::vector<float> result = Heights(detail.resultHips);
+    Chart chart = NewChart("Height of the hips", "mm above the floor");
     AddBothSides(chart, source, result);
     AppendChart(page, chart, m_uiMostPoints);
 }

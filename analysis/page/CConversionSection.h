@@ -30,7 +30,7 @@ private:
     Chart NewChart(const std::string& title, std::string_view unit) const;
     void AppendKnee(CMarkup& page, const FootDetail& foot, const std::string& name) const;
     void AppendSole(CMarkup& page, const FootDetail& foot, const std::string& name) const;
-    void AppendRootHeight(CMarkup& page) const;
+    void AppendHipHeight(CMarkup& page) const;
 
     const ConvertedMotion& motion_;
     size_t m_uiMostPoints;

@@ -51,9 +51,12 @@ double TiltOf(const FootMeasures& foot)
 {
     return std::max(0.0, foot.soleTiltMean - foot.sourceSoleTiltMean);
 }
-double SlideOf(const FootMeasures& foot)
+
+// Nothing where no joint is ever planted.
+template <SlideMeasures ConversionMeasures::*slide, double SlideMeasures::*figure>
+Optional Slide(const ConversionMeasures& measures, const ConversionDetail&)
 {
-    return foot.addedSlideLargest;
+    return (measures.*slide).plants > 0 ? Optional(measures.*slide.*figure) : std::nullopt;
 }
 
 Optional KneePops(const ConversionMeasures& measures, const ConversionDetail&)
@@ -85,20 +88,51 @@ struct Row
     double good; // the last figure that is good
     double fair; // the last one that is fair
     Optional (*value)(const ConversionMeasures&, const ConversionDetail&);
+    std::string_view meaning;
 };
 
+using Sums = ConversionMeasures;
+
+// clang-format off
 constexpr Row kRows[] = {
-    {"directionError", "Direction error", "°",  1, EIdeal::Least,   3.0,  5.0,  DirectionError                      },
-    {"footTurn",       "Foot turn",       "°",  1, EIdeal::Least,   3.0,  10.0, OfFeet<TurnOf>                      },
-    {"soleTilt",       "Sole tilt",       "°",  1, EIdeal::Least,   10.0, 20.0, OfFeet<TiltOf>                      },
-    {"addedSlide",     "Added slide",     " mm", 1, EIdeal::Least,   5.0,  15.0, OfFeet<SlideOf>                     },
-    {"contactF1",      "Contacts F1",     "",    3, EIdeal::Largest, 0.95, 0.9,  Of<&ConversionMeasures::contactF1>  },
-    {"floor",          "Floor",           " mm", 1, EIdeal::Zero,    10.0, 30.0, Of<&ConversionMeasures::floorHeight>},
-    {"sinking",        "Sinking",         " mm", 1, EIdeal::Least,   10.0, 30.0, SinkDepth                           },
-    {"kneePops",       "Knee pops",       "",    0, EIdeal::Least,   0.0,  2.0,  KneePops                            },
-    {"jitterRatio",    "Jitter ratio",    "",    2, EIdeal::Least,   1.1,  1.5,  Of<&ConversionMeasures::jitterRatio>},
-    {"travelRatio",    "Travel ratio",    "",    3, EIdeal::One,     0.01, 0.05, Of<&ConversionMeasures::travelRatio>},
+    {"directionError", "Direction error", "°", 1, EIdeal::Least, 3.0, 5.0, DirectionError,
+     "How far the main bones point away from the source's, as an angle: the mean over bones and frames."},
+    {"trunkMean", "Trunk, mean", "°", 1, EIdeal::Least, 2.0, 4.0, Of<&Sums::trunkMean>,
+     "How far the line from the middle of the hip joints to the neck leans away from the source's: the mean over the frames, without the difference that the two rest poses have."},
+    {"trunkMost", "Trunk, 95 %", "°", 1, EIdeal::Least, 5.0, 10.0, Of<&Sums::trunkMost>,
+     "The same angle, which one frame in twenty exceeds."},
+    {"footTurn", "Foot turn", "°", 1, EIdeal::Least, 3.0, 10.0, OfFeet<TurnOf>,
+     "How far the worse foot points to the left or right of the source's, seen from above: the mean over the frames."},
+    {"soleTilt", "Sole tilt", "°", 1, EIdeal::Least, 10.0, 20.0, OfFeet<TiltOf>,
+     "How much more the sole of the worse foot is tilted than the source's while it stands."},
+    {"ankleSlideMedian", "Ankle slide, median", " mm", 1, EIdeal::Least, 3.0, 6.0, Slide<&Sums::ankleSlide, &SlideMeasures::median>,
+     "How much farther a planted ankle slides over the floor than the source's: half of all plants are better."},
+    {"ankleSlideLargest", "Ankle slide, worst", " mm", 1, EIdeal::Least, 15.0, 30.0, Slide<&Sums::ankleSlide, &SlideMeasures::largest>,
+     "The same slide for the worst plant."},
+    {"toeSlideMedian", "Toe slide, median", " mm", 1, EIdeal::Least, 3.0, 6.0, Slide<&Sums::toeSlide, &SlideMeasures::median>,
+     "How much farther a planted toe slides over the floor than the source's, whether its heel is up or down: half of all plants are better."},
+    {"toeSlideLargest", "Toe slide, worst", " mm", 1, EIdeal::Least, 15.0, 30.0, Slide<&Sums::toeSlide, &SlideMeasures::largest>,
+     "The same slide for the worst plant."},
+    {"contactF1", "Contacts F1", "", 3, EIdeal::Largest, 0.97, 0.9, Of<&Sums::contactF1>,
+     "How well the frames in which feet stand match the source's, 1 being a perfect match; frames in which the source's foot moves at 15 to 30 cm/s do not count."},
+    {"heldSole", "Held soles", " mm", 1, EIdeal::Least, 5.0, 15.0, Of<&Sums::heldSole>,
+     "How far a sole is above or below the floor while the source's foot stands; one frame in twenty is worse."},
+    {"sinking", "Sinking", " mm", 1, EIdeal::Least, 8.0, 20.0, SinkDepth,
+     "How far the lower one of the soles is below the floor; one frame in twenty is worse."},
+    {"kneePops", "Knee pops", "", 0, EIdeal::Least, 0.0, 2.0, KneePops,
+     "How often a knee bends or straightens within 1/30 s by over 5° more than the source's does within 1/15 s before or after."},
+    {"jitterRatio", "Leg jitter, median", "", 2, EIdeal::Least, 1.05, 1.3, Of<&Sums::jitterRatio>,
+     "How much thighs and calves shake when seen at 30 frames a second, divided by the source's: half of these bones are better."},
+    {"jitterRatioLargest", "Leg jitter, worst", "", 2, EIdeal::Least, 1.3, 1.6, Of<&Sums::jitterRatioLargest>,
+     "The same ratio for the worst of these bones."},
+    {"travelRatio", "Hip path", "", 3, EIdeal::One, 0.01, 0.05, Of<&Sums::travelRatio>,
+     "How long the path of the hips over the ground is, divided by the source's; only where that is 50 cm or more."},
+    {"handGap", "Hand gap", " mm", 1, EIdeal::Least, 30.0, 60.0, Of<&Sums::handGap>,
+     "How much farther a hand is, or nearer, than the source's from the thigh, torso, head, other hand or floor that the source's touches; one frame in twenty is worse."},
+    {"handDepth", "Hands below floor", " mm", 1, EIdeal::Least, 20.0, 50.0, Of<&Sums::handDepth>,
+     "How far a hand gets below the floor at most."},
 };
+// clang-format on
 
 // How far a figure is from the ideal, so that less is better.
 double Distance(EIdeal ideal, double value)
@@ -170,8 +204,8 @@ std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const Co
     for (const Row& row : kRows)
     {
         const Optional value = row.value(measures, detail);
-        figures.push_back(
-            {row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value), MarkOf(row)});
+        figures.push_back({row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value),
+                           MarkOf(row), row.meaning});
     }
     return figures;
 }

@@ -31,7 +31,8 @@ struct KeyFigure
     int decimals = 0;
     std::optional<double> value;
     EVerdict verdict = EVerdict::None;
-    std::string mark; ///< what is good and what is fair, in words
+    std::string mark;         ///< what is good and what is fair, in words
+    std::string_view meaning; ///< a sentence
 };
 
 /// How many there are.

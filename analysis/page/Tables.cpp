@@ -77,11 +77,12 @@ void PlainCell(CMarkup& page, const Record* record)
         page.Raw("<td></td>");
 }
 
-// Rows of the table of feet. A cell is what its function appends.
-struct FootRow
+// Rows of the tables of feet and hands. A cell is what its function appends.
+template <class Record>
+struct RecordRow
 {
     std::string_view label;
-    void (*append)(CMarkup& page, const FootMeasures& foot);
+    void (*append)(CMarkup& page, const Record& record);
 };
 
 template <auto member, int decimals>
@@ -113,29 +114,118 @@ void F1(CMarkup& page, const FootMeasures& foot)
         page.Raw("none");
 }
 
+void Plants(CMarkup& page, const SlideMeasures& slide)
+{
+    page.Integer(static_cast<long long>(slide.plants));
+}
+
+void MedianSlide(CMarkup& page, const SlideMeasures& slide)
+{
+    page.Number(slide.median, 2);
+}
+
+void LargestSlide(CMarkup& page, const SlideMeasures& slide)
+{
+    page.Number(slide.largest, 2).Raw(" <small>frame ").Integer(slide.largestFrame).Raw("</small>");
+}
+
+// Only the first figure has something to say of a joint that is never planted.
+template <SlideMeasures FootMeasures::*slide, void (*append)(CMarkup&, const SlideMeasures&)>
+void Slides(CMarkup& page, const FootMeasures& foot)
+{
+    if ((foot.*slide).plants > 0 || append == Plants)
+        append(page, foot.*slide);
+    else
+        page.Raw("none");
+}
+
 using Foot = FootMeasures;
 
 // Rows are calls, which the formatter leaves as they are read.
-constexpr FootRow Row(std::string_view label, void (*append)(CMarkup&, const FootMeasures&))
+constexpr RecordRow<FootMeasures> FootRow(std::string_view label,
+                                          void (*append)(CMarkup&, const FootMeasures&))
 {
     return {label, append};
 }
 
-constexpr FootRow kFootRows[] = {
-    Row("contacts", Both<&Foot::resultContacts, &Foot::sourceContacts, 0>),
-    Row("planted frames", Both<&Foot::resultStanding, &Foot::sourceStanding, 0>),
-    Row("contacts F1", F1),
-    Row("added slide, mean mm", One<&Foot::addedSlideMean, 2>),
-    Row("added slide, max mm", AtFrame<&Foot::addedSlideLargest, &Foot::addedSlideFrame, 2>),
-    Row("turn, mean °", One<&Foot::turnError, 2>),
-    Row("turn while planted, mean °", One<&Foot::turnWhileStanding, 2>),
-    Row("turn, most °", One<&Foot::turnLargest, 2>),
-    Row("sole tilt, mean °", Both<&Foot::soleTiltMean, &Foot::sourceSoleTiltMean, 2>),
-    Row("sole tilt, max °", One<&Foot::soleTiltLargest, 2>),
-    Row("knee pops", One<&Foot::kneePops, 0>),
-    Row("knee pop beyond the source, max °", AtFrame<&Foot::kneePopLargest, &Foot::kneePopFrame, 2>),
-    Row("knee change, max °", Both<&Foot::kneeChangeLargest, &Foot::sourceKneeChangeLargest, 2>),
+constexpr RecordRow<FootMeasures> kFootRows[] = {
+    FootRow("contacts", Both<&Foot::resultContacts, &Foot::sourceContacts, 0>),
+    FootRow("planted frames that count", Both<&Foot::resultStanding, &Foot::sourceStanding, 0>),
+    FootRow("contacts F1", F1),
+    FootRow("ankle plants", Slides<&Foot::ankleSlide, Plants>),
+    FootRow("added ankle slide, median mm", Slides<&Foot::ankleSlide, MedianSlide>),
+    FootRow("added ankle slide, worst mm", Slides<&Foot::ankleSlide, LargestSlide>),
+    FootRow("toe plants", Slides<&Foot::toeSlide, Plants>),
+    FootRow("added toe slide, median mm", Slides<&Foot::toeSlide, MedianSlide>),
+    FootRow("added toe slide, worst mm", Slides<&Foot::toeSlide, LargestSlide>),
+    FootRow("held sole, 95 % mm", One<&Foot::heldSole, 2>),
+    FootRow("held sole, worst mm", AtFrame<&Foot::heldSoleLargest, &Foot::heldSoleFrame, 2>),
+    FootRow("turn, mean °", One<&Foot::turnError, 2>),
+    FootRow("turn while planted, mean °", One<&Foot::turnWhileStanding, 2>),
+    FootRow("turn, most °", One<&Foot::turnLargest, 2>),
+    FootRow("sole tilt, mean °", Both<&Foot::soleTiltMean, &Foot::sourceSoleTiltMean, 2>),
+    FootRow("sole tilt, max °", One<&Foot::soleTiltLargest, 2>),
+    FootRow("knee pops", One<&Foot::kneePops, 0>),
+    FootRow("knee pop beyond the source, max °", AtFrame<&Foot::kneePopLargest, &Foot::kneePopFrame, 2>),
 };
+
+void Gap(CMarkup& page, const HandMeasures& hand)
+{
+    if (!hand.gap)
+        page.Raw("none");
+    else
+        page.Number(*hand.gap, 2).Raw(" <small>").Raw(hand.gapPart).Raw("</small>");
+}
+
+void LargestGap(CMarkup& page, const HandMeasures& hand)
+{
+    if (!hand.gap)
+        page.Raw("none");
+    else
+        page.Number(hand.gapLargest, 2).Raw(" <small>frame ").Integer(hand.gapFrame).Raw("</small>");
+}
+
+void Depth(CMarkup& page, const HandMeasures& hand)
+{
+    page.Number(hand.depth, 2).Raw(" <small>frame ").Integer(hand.depthFrame).Raw("</small>");
+}
+
+void Touches(CMarkup& page, const HandMeasures& hand)
+{
+    page.Integer(static_cast<long long>(hand.touchFrames));
+}
+
+constexpr RecordRow<HandMeasures> kHandRows[] = {
+    {"frames that touch", Touches   },
+    {"gap, 95 % mm",      Gap       },
+    {"gap, worst mm",     LargestGap},
+    {"below floor, mm",   Depth     },
+};
+
+// A row for each figure and a column for each foot or hand; nothing without any.
+template <class Record, size_t count>
+void AppendRecordTable(CMarkup& page, std::string_view title, const std::vector<Record>& records,
+                       const RecordRow<Record> (&rows)[count])
+{
+    if (records.empty())
+        return;
+    page.Raw("<div class=\"wide\"><table><thead><tr><th class=\"word\">").Raw(title).Raw("</th>");
+    for (const Record& record : records)
+        page.Raw("<th>").Name(record.target).Raw(" <small>").Name(record.source).Raw("</small></th>");
+    page.Raw("</tr></thead><tbody>\n");
+    for (const RecordRow<Record>& row : rows)
+    {
+        page.Raw("<tr><td class=\"word\">").Raw(row.label).Raw("</td>");
+        for (const Record& record : records)
+        {
+            page.Raw("<td>");
+            row.append(page, record);
+            page.Raw("</td>");
+        }
+        page.Raw("</tr>\n");
+    }
+    EndTable(page);
+}
 
 } // namespace
 
@@ -161,7 +251,7 @@ void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const Me
 
 void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain)
 {
-    BeginTable(page, {"bone", "source"}, {"max °", "at frame", "jitter", "source jitter"}, plain != nullptr);
+    BeginTable(page, {"bone", "source"}, {"max °", "at frame"}, plain != nullptr);
     for (const BoneMeasures& bone : measured.sums.bones)
     {
         if (!bone.measured)
@@ -174,8 +264,6 @@ void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const Me
             PlainCell(page, BoneOf(*plain, bone.target));
         NumberCell(page, bone.largestError, 3);
         FrameCell(page, bone.largestFrame);
-        NumberCell(page, bone.resultJitter, 5);
-        NumberCell(page, bone.sourceJitter, 5);
         page.Raw("</tr>\n");
     }
     page.Raw("<tr class=\"sum\"><td class=\"word\">all</td><td></td>");
@@ -184,33 +272,14 @@ void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const Me
         NumberCell(page, plain->sums.meanError, 3);
     NumberCell(page, measured.sums.largestError, 3);
     page.Raw("<td></td>");
-    NumberCell(page, measured.sums.resultJitter, 5);
-    NumberCell(page, measured.sums.sourceJitter, 5);
     page.Raw("</tr>\n");
     EndTable(page);
 }
 
-void AppendFootTable(CMarkup& page, const MeasuredConversion& measured)
+void AppendFeetAndHands(CMarkup& page, const MeasuredConversion& measured)
 {
-    const std::vector<FootMeasures>& feet = measured.sums.feet;
-    if (feet.empty())
-        return;
-    page.Raw("<div class=\"wide\"><table><thead><tr><th class=\"word\">feet</th>");
-    for (const FootMeasures& foot : feet)
-        page.Raw("<th>").Name(foot.target).Raw(" <small>").Name(foot.source).Raw("</small></th>");
-    page.Raw("</tr></thead><tbody>\n");
-    for (const FootRow& row : kFootRows)
-    {
-        page.Raw("<tr><td class=\"word\">").Raw(row.label).Raw("</td>");
-        for (const FootMeasures& foot : feet)
-        {
-            page.Raw("<td>");
-            row.append(page, foot);
-            page.Raw("</td>");
-        }
-        page.Raw("</tr>\n");
-    }
-    EndTable(page);
+    AppendRecordTable(page, "feet", measured.sums.feet, kFootRows);
+    AppendRecordTable(page, "hands", measured.sums.hands, kHandRows);
 }
 
 } // namespace gw

@@ -117,6 +117,11 @@ bool CConversion::Align(EAlignedJoints joints)
                       BodyOfTable(retargeter_, CNodeNames(target))};
     ReportRecord(input_.sourcePath, record, input_.choices, report_);
     CompleteBody(source.body);
+    if (input_.choices.faithful)
+    {
+        source.limbs = ELimbWays::Mean;
+        DriveHands(retargeter_, target, source.body);
+    }
     Alignment alignment;
     if (record.Failure())
         return false;
@@ -134,7 +139,9 @@ bool CConversion::Align(EAlignedJoints joints)
 
 void CConversion::Run(bool useLegs, const std::function<void(size_t, size_t)>& progress)
 {
+    target_.quarterTurns = input_.choices.align ? EQuarterTurns::ReadBack : EQuarterTurns::Flipped;
     retargeter_.SetFaithful(input_.choices.faithful);
+    retargeter_.SetHoldHands(input_.choices.holdHands);
     retargeter_.SetProgress(progress);
     retargeter_.Retarget(0.0f, input_.timing.lastFrame, 0.0f, input_.timing.frequency, kRootPosition, true,
                          useLegs);

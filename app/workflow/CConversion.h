@@ -27,7 +27,8 @@ inline constexpr Vec3 kRootPosition{0.0f, 923.0f, 13.0f};
 struct ConversionChoices
 {
     bool align = false;    ///< the source is told from a rest pose that suits the rules
-    bool faithful = false; ///< hips, knees and feet keep to the source
+    bool faithful = false; ///< trunk, hips, knees and feet keep to the source
+    bool holdHands = true; ///< and, where that is chosen, hands to what they touch
 };
 
 /// What a conversion is made from. Nodes and rows are looked at and must outlive the conversion.

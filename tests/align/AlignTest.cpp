@@ -9,6 +9,7 @@
 #include "Directions.h"
 #include "Rotations.h"
 #include "Skeleton.h"
+#include "UpAxis.h"
 
 #include <algorithm>
 #include <gtest/gtest.h>
@@ -362,6 +363,36 @@ TEST(PlanAlignment, RefusesWhatIsNoBody)
     motion.body.hip = nullptr;
     EXPECT_FALSE(PlanAlignment(motion, alignment)) << "no hip";
     EXPECT_FALSE(PlanAlignment(BodyMotion(), alignment)) << "nothing";
+}
+
+TEST(UpAxis, IsThatOfABodyThatIsUpsideDownForPartOfTheMotion)
+{
+    const Mat3 zUp = TurnAbout(kVec3UnitX, 90.0);
+    const struct
+    {
+        const char* what;
+        Turn turn;
+        Mat3 world;
+        Vec3 up;
+    } rows[] = {
+        {"Y up",                       Everywhere(kMat3Identity), kMat3Identity, kVec3UnitY},
+        {"Z up, with a rest pose too", Everywhere(zUp),           zUp,           kVec3UnitZ},
+        {"Z up in the motion alone",   Everywhere(kMat3Identity), zUp,           kVec3UnitZ},
+        {"bones along X, with Z up",   AlongX,                    zUp,           kVec3UnitZ},
+        {"bones along X",              AlongX,                    kMat3Identity, kVec3UnitY},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        CMadeBody::Telling telling;
+        telling.turn = row.turn;
+        telling.world = row.world;
+        telling.frameCount = 60;
+        telling.tumbling = 35;
+        const CMadeBody made(telling);
+        const BodyMotion motion = made.Motion();
+        EXPECT_EQ(FindUpAxis(motion.body, motion.frequency, motion.frameCount), row.up);
+    }
 }
 
 } // namespace

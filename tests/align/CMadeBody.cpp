@@ -88,7 +88,10 @@ CMadeBody::CMadeBody(const Telling& telling) : m_iFrames(telling.frameCount)
             for (const MadeBone& joint : joints)
             {
                 Mat4& matrix = figure.Bone(joint.name).m_kMatrix;
-                const Mat3 turn = Mat3Transpose(telling.turn(joint.name)) * Pose(joint.name, frame);
+                const int over = std::max(0, frame - telling.frameCount + telling.tumbling);
+                const Mat3 tumble = TurnAbout(kVec3UnitZ, 360.0 * over / std::max(telling.tumbling, 1));
+                const Mat3 pose = Pose(joint.name, frame) * (*joint.parent ? kMat3Identity : tumble);
+                const Mat3 turn = Mat3Transpose(telling.turn(joint.name)) * pose;
                 matrix = Mat4Compose(turn * above(joint.parent),
                                      *joint.parent ? matrix.Translation() * (telling.doubled ? 2.0f : 1.0f)
                                                    : Turned(RootPlace(frame), telling.world));

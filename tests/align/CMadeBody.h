@@ -22,6 +22,7 @@ public:
         std::function<Mat3(const std::string& joint)> turn = [](const std::string&) { return kMat3Identity; };
         Mat3 world = kMat3Identity; ///< rotates the whole motion
         bool doubled = false;       ///< positions repeat the offsets
+        int tumbling = 0;           ///< frames at the end in which it turns over sideways, head first
         int frameCount = 40;
         std::vector<std::string> without; ///< missing joints, with their subtrees
     };

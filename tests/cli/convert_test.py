@@ -102,19 +102,30 @@ class Convert(CliTest):
         self.assertTrue(changed)
         self.assertLessEqual(changed, {"LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
 
-    def test_a_faithful_result_keeps_to_the_source_and_differs_in_root_and_legs_alone(self):
+    def test_a_faithful_result_keeps_to_the_source_and_differs_in_trunk_and_legs_alone(self):
         for name, options in (("plain.htr", []), ("faithful.htr", ["--faithful"])):
             self.succeed("convert", "walk.bvh", "-o", name, *options)
         nodes = [json.loads(self.run_program("pose", name, "--frame", 40).out)["nodes"]
                  for name in ("plain.htr", "faithful.htr")]
         changed = {a["name"] for a, b in zip(*nodes) if a["local"] != b["local"]}
-        self.assertEqual(changed, {"LowerTorso", "LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
+        self.assertEqual(changed, {"LowerTorso", "Waist", "UpperTorso", "Neck", "LCollar", "RCollar",
+                                   "LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
         measures = json.loads(self.succeed("compare", "walk.bvh", "faithful.htr", "--profile", "Poser BVH",
                                            "--json").out)
         self.assertAlmostEqual(measures["travelRatio"], 1, delta=0.01)
         for bone in measures["bones"]:
             if bone["target"][1:] in ("Thigh", "Calf"):
                 self.assertLess(bone["meanError"], 1, bone["target"])
+
+    def test_without_hands_the_arms_of_a_faithful_result_differ_and_nothing_else(self):
+        self.write("wave.bvh", WALK.with_name("wave.bvh").read_bytes())
+        for name, options in (("with.htr", []), ("without.htr", ["--no-hands"])):
+            self.succeed("convert", "wave.bvh", "-o", name, "--profile", "Max BVH", "--align", "--faithful", *options)
+        sections = [dict(part.split("]", 1) for part in self.read(name).decode().split("[")[1:])
+                    for name in ("with.htr", "without.htr")]
+        changed = {name for name in sections[0] if sections[0][name] != sections[1][name]}
+        self.assertTrue(changed)
+        self.assertLessEqual(changed, {side + bone for side in "LR" for bone in ("UpperArm", "Forearm", "Hand")})
 
     def test_a_result_that_cannot_fit_is_refused_before_the_work(self):
         self.write("slow.prf", profile("Slow", [("Hips", "LowerTorso")], rate=1))  # 120 rows for each frame

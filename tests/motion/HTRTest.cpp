@@ -327,6 +327,47 @@ TEST(TKHTRStream, WritesThePosesOfTheTree)
     }
 }
 
+// What is taken from memory after a save is what the file has, quarter turns and all.
+TEST(TKHTRStream, QuarterTurnsReadBackWhereThatIsAskedFor)
+{
+    const struct
+    {
+        Vec3 degrees;
+        double flippedBy; // read back from what the rule for all poses writes
+    } rows[] = {
+        {{0, 90, 0},     180.0},
+        {{0, -90, 0},    180.0},
+        {{30, 90, 40},   180.0},
+        {{-20, -90, 70}, 180.0},
+        {{5, 89.9f, 3},  0.0  },
+        {{5, 60, 3},     0.0  },
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.degrees.x + row.degrees.y);
+        for (const EQuarterTurns turns : {EQuarterTurns::ReadBack, EQuarterTurns::Flipped})
+        {
+            CLoadedMotion file(kMoving, "a.htr");
+            file.motion.quarterTurns = turns;
+            CNode& head = *FindNode(file.motion.motionRoot.Get(), "Head");
+            const Mat3 turn = EulerToMat3("ZYX", row.degrees);
+            static_cast<CKeyframeControl*>(head.GetControl())->m_kRotationKeys[1] = QuatFromMat3(turn);
+            const std::string path = file.folder.Path("b.htr");
+            ASSERT_TRUE(file.motion.Save(path, 1.0f));
+            CMotionFile written;
+            ASSERT_TRUE(written.Load(path));
+            const Mat3 read = NormalizedRows(PosedNode(written, "Head", 1).m_kMatrix);
+            if (turns == EQuarterTurns::ReadBack)
+                EXPECT_LT(DegreesBetween(read, turn), kTolerance);
+            else
+                EXPECT_NEAR(DegreesBetween(read, turn), row.flippedBy, 0.1);
+            TakeWrittenPoses(file.motion);
+            EXPECT_LT(DegreesBetween(NormalizedRows(PosedNode(file.motion, "Head", 1).m_kMatrix), read),
+                      kTolerance);
+        }
+    }
+}
+
 // A name means the first of its bearers, and each of them has a section of its own when the motion is
 // written.
 TEST(TKHTRStream, TellsSegmentsOfOneNameApart)

@@ -4,6 +4,7 @@
 #include "CMarkup.h"
 #include "CPagePart.h"
 #include "ConvertedMotion.h"
+#include "KeyFigures.h"
 #include "PairedFigures.h"
 #include "TempFolder.h"
 
@@ -117,9 +118,14 @@ TEST(Page, ShowsTheFramesOfMadeFaultsWithBothSkeletons)
 {
     const std::string page = CMadeConversion(kFaulty).Page();
     ExpectBalanced(page);
-    EXPECT_TRUE(Has(page, "<b>Frame 20</b> mean error of the main bones"));
-    EXPECT_TRUE(Has(page, "largest at LForearm, 60.0°"));
+    EXPECT_TRUE(Has(page, "<b>Frame 35</b> LFoot is planted but slides 96.8 mm farther than in the source"));
+    EXPECT_TRUE(Has(page, "<b>Frame 35</b> the toe of LFoot is planted but slides"));
     EXPECT_TRUE(Has(page, "<b>Frame 35</b> the knee above LFoot jumps by 14.0°"));
+    const std::string directions = CMadeConversion([](CMadeFigure& figure, int frame) {
+                                       figure.Turn("LForearm", kVec3UnitZ, frame == 20 ? 60.0 : 1.0);
+                                   }).Page();
+    EXPECT_TRUE(Has(directions, "<b>Frame 20</b> mean error of the main bones"));
+    EXPECT_TRUE(Has(directions, "largest at LForearm, 60.0°"));
     const size_t frames = Count(page, "<article>");
     EXPECT_EQ(frames, 3u);
     EXPECT_EQ(Count(page, "aria-label=\"source, from"), 2 * frames);
@@ -153,13 +159,13 @@ TEST(Page, HostileNamesAreTextAndNothingElse)
     EXPECT_EQ(CMarkup().Name(std::string(100000, 'x')).Text().size(), 300 + std::string_view("…").size());
 }
 
-TEST(Page, ShowsTheWaysOfBothRootsInOneScale)
+TEST(Page, ShowsTheWaysOfBothHipsInOneScale)
 {
     const auto walking = [](CMadeFigure& figure, int frame) {
         figure.Move("LowerTorso", {0.0f, 0.0f, 50.0f * static_cast<float>(frame)});
     };
     const std::string page = CMadeConversion(walking).Page();
-    const size_t way = page.find("class=\"curve result\"", page.find("Way of the root"));
+    const size_t way = page.find("class=\"curve result\"", page.find("Way of the hips"));
     ASSERT_NE(way, page.npos);
     EXPECT_EQ(page.substr(page.find(" d=", way), 14), " d=\"M150.0 0.0") << "begins at the far edge";
     EXPECT_TRUE(Has(page, "L150.0 130.0\"")) << "and ends at the near one";
@@ -174,6 +180,7 @@ TEST(Page, SaysHowAFigureStandsInWords)
     EXPECT_TRUE(Has(same, "– None")) << "a motion that stands still has no jitter to compare";
     EXPECT_FALSE(Has(same, "Poor"));
     EXPECT_FALSE(Has(same, "Worst frames"));
+    EXPECT_EQ(Count(same, "</dt><dd>How") + Count(same, "</dt><dd>The same"), KeyFigureCount());
 }
 
 TEST(Page, LongMotionsStaySmall)

@@ -20,8 +20,8 @@ constexpr ShellCommand Row(std::string_view name, std::string_view operands, uin
 constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit;
 
 constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |
-                                     kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck | kHtml |
-                                     kManyOptions;
+                                     kNoHands | kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck |
+                                     kHtml | kManyOptions;
 
 constexpr uint64_t kBatchOptions = kJob | kProfile | kOutputFolder | kKeepGoing | kManyOptions;
 

@@ -44,6 +44,7 @@ enum EOption : uint64_t
     kTimeLimit = 1ull << 30,
     kShards = 1ull << 31,
     kShard = 1ull << 32,
+    kNoHands = 1ull << 33,
 };
 
 /// Options that control how a run works, but not what a source is converted to. All others are part of a

@@ -38,7 +38,10 @@ constexpr OptionRow kOptions[] = {
     Row(kNoLegs, "--no-legs", "", &ShellOptions::noLegs,
         "do not plant the feet where the source's feet are planted"),
     Row(kFaithful, "--faithful", "", &ShellOptions::faithful,
-        "keep hips, knees and feet close to the source; pin planted feet"),
+        "keep trunk, hips, knees and feet close to the source; pin planted feet; keep hands where they "
+        "touch"),
+    Row(kNoHands, "--no-hands", "", &ShellOptions::noHands,
+        "with --faithful, leave the hands where the arms put them"),
     Row(kAlign, "--align", "", &ShellOptions::align,
         "point bones as in the source, whatever its rest pose; ignores the profile's offsets"),
     Row(kForce, "--force", "", &ShellOptions::force, "replace existing files"),

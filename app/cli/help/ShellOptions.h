@@ -61,7 +61,8 @@ struct ShellOptions
     bool resume = false;        ///< skip sources whose output is already up to date
     bool nullSeparated = false; ///< the names in the list of sources are separated by zero bytes
     bool align = false;         ///< first re-express the source relative to a T-pose
-    bool faithful = false;      ///< keep hips, knees and feet close to the source
+    bool faithful = false;      ///< keep trunk, hips, knees, feet and hands close to the source
+    bool noHands = false;       ///< but not the hands
     bool check = false;         ///< measure each result
     bool objects = false;       ///< print all spatial objects, not only nodes
 };

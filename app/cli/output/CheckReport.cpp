@@ -25,9 +25,14 @@ struct FaultWords
 
 // By EFrameFault.
 constexpr FaultWords kFaults[] = {
-    {"direction", "mean error of the main bones", "deg"},
-    {"kneePop",   "knee pop beyond the source's", "deg"},
-    {"slide",     "added slide",                "mm" },
+    {"direction",  "mean error of the main bones", "deg"},
+    {"trunk",      "trunk error",                  "deg"},
+    {"kneePop",    "knee pop beyond the source's", "deg"},
+    {"ankleSlide", "added slide of the ankle",     "mm" },
+    {"toeSlide",   "added slide of the toe",       "mm" },
+    {"heldSole",   "held sole off the floor by",   "mm" },
+    {"handGap",    "hand gap",                     "mm" },
+    {"handDepth",  "hand below the floor by",      "mm" },
 };
 
 const FaultWords& WordsOf(const WorstFrame& worst)
@@ -88,6 +93,8 @@ void WriteWorst(CJsonWriter& json, const std::vector<WorstFrame>& frames)
         json.Key("amount").Number(static_cast<float>(worst.amount));
         json.Key("target").Text(worst.target);
         json.Key("source").Text(worst.source);
+        if (!worst.part.empty())
+            json.Key("part").Text(worst.part);
         json.EndObject();
     }
     json.EndArray();

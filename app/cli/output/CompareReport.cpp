@@ -14,13 +14,20 @@ namespace {
 // The type of a record's figure.
 template <class Record>
 using Figure = std::variant<double Record::*, std::optional<double> Record::*, size_t Record::*,
-                            int Record::*, bool Record::*, std::string Record::*>;
+                            int Record::*, bool Record::*, std::string Record::*, SlideMeasures Record::*>;
 
 template <class Record>
 struct FigureRow
 {
     const char* name;
     Figure<Record> member;
+};
+
+constexpr FigureRow<SlideMeasures> kSlideFigures[] = {
+    {"plants",       &SlideMeasures::plants      },
+    {"median",       &SlideMeasures::median      },
+    {"largest",      &SlideMeasures::largest     },
+    {"largestFrame", &SlideMeasures::largestFrame},
 };
 
 constexpr FigureRow<BoneMeasures> kBoneFigures[] = {
@@ -32,55 +39,69 @@ constexpr FigureRow<BoneMeasures> kBoneFigures[] = {
     {"meanError",    &BoneMeasures::meanError   },
     {"largestError", &BoneMeasures::largestError},
     {"largestFrame", &BoneMeasures::largestFrame},
-    {"sourceJitter", &BoneMeasures::sourceJitter},
-    {"resultJitter", &BoneMeasures::resultJitter},
 };
 
 constexpr FigureRow<FootMeasures> kFootFigures[] = {
-    {"target",                  &FootMeasures::target                 },
-    {"source",                  &FootMeasures::source                 },
-    {"turnMean",                &FootMeasures::turnMean               },
-    {"turnError",               &FootMeasures::turnError              },
-    {"turnLargest",             &FootMeasures::turnLargest            },
-    {"turnWhileStanding",       &FootMeasures::turnWhileStanding      },
-    {"turnFromStart",           &FootMeasures::turnFromStart          },
-    {"soleTiltMean",            &FootMeasures::soleTiltMean           },
-    {"soleTiltLargest",         &FootMeasures::soleTiltLargest        },
-    {"sourceSoleTiltMean",      &FootMeasures::sourceSoleTiltMean     },
-    {"addedSlideMean",          &FootMeasures::addedSlideMean         },
-    {"addedSlideLargest",       &FootMeasures::addedSlideLargest      },
-    {"addedSlideMeanShare",     &FootMeasures::addedSlideMeanShare    },
-    {"addedSlideLargestShare",  &FootMeasures::addedSlideLargestShare },
-    {"sourceSlideShare",        &FootMeasures::sourceSlideShare       },
-    {"resultSlideShare",        &FootMeasures::resultSlideShare       },
-    {"sourceContacts",          &FootMeasures::sourceContacts         },
-    {"resultContacts",          &FootMeasures::resultContacts         },
-    {"sourceStanding",          &FootMeasures::sourceStanding         },
-    {"resultStanding",          &FootMeasures::resultStanding         },
-    {"bothStanding",            &FootMeasures::bothStanding           },
-    {"contactF1",               &FootMeasures::contactF1              },
-    {"kneePops",                &FootMeasures::kneePops               },
-    {"kneePopLargest",          &FootMeasures::kneePopLargest         },
-    {"kneeChangeLargest",       &FootMeasures::kneeChangeLargest      },
-    {"sourceKneeChangeLargest", &FootMeasures::sourceKneeChangeLargest},
+    {"target",             &FootMeasures::target            },
+    {"source",             &FootMeasures::source            },
+    {"turnMean",           &FootMeasures::turnMean          },
+    {"turnError",          &FootMeasures::turnError         },
+    {"turnLargest",        &FootMeasures::turnLargest       },
+    {"turnWhileStanding",  &FootMeasures::turnWhileStanding },
+    {"turnFromStart",      &FootMeasures::turnFromStart     },
+    {"soleTiltMean",       &FootMeasures::soleTiltMean      },
+    {"soleTiltLargest",    &FootMeasures::soleTiltLargest   },
+    {"sourceSoleTiltMean", &FootMeasures::sourceSoleTiltMean},
+    {"ankleSlide",         &FootMeasures::ankleSlide        },
+    {"toeSlide",           &FootMeasures::toeSlide          },
+    {"sourceContacts",     &FootMeasures::sourceContacts    },
+    {"resultContacts",     &FootMeasures::resultContacts    },
+    {"sourceStanding",     &FootMeasures::sourceStanding    },
+    {"resultStanding",     &FootMeasures::resultStanding    },
+    {"bothStanding",       &FootMeasures::bothStanding      },
+    {"contactF1",          &FootMeasures::contactF1         },
+    {"kneePops",           &FootMeasures::kneePops          },
+    {"kneePopLargest",     &FootMeasures::kneePopLargest    },
+    {"heldSole",           &FootMeasures::heldSole          },
+    {"heldSoleLargest",    &FootMeasures::heldSoleLargest   },
+    {"heldSoleFrame",      &FootMeasures::heldSoleFrame     },
+};
+
+constexpr FigureRow<HandMeasures> kHandFigures[] = {
+    {"target",      &HandMeasures::target     },
+    {"source",      &HandMeasures::source     },
+    {"touchFrames", &HandMeasures::touchFrames},
+    {"gap",         &HandMeasures::gap        },
+    {"gapPart",     &HandMeasures::gapPart    },
+    {"gapLargest",  &HandMeasures::gapLargest },
+    {"gapFrame",    &HandMeasures::gapFrame   },
+    {"depth",       &HandMeasures::depth      },
+    {"depthFrame",  &HandMeasures::depthFrame },
 };
 
 constexpr FigureRow<ConversionMeasures> kFigures[] = {
-    {"frameCount",   &ConversionMeasures::frameCount  },
-    {"frameScale",   &ConversionMeasures::frameScale  },
-    {"sourceLeg",    &ConversionMeasures::sourceLeg   },
-    {"resultLeg",    &ConversionMeasures::resultLeg   },
-    {"meanError",    &ConversionMeasures::meanError   },
-    {"largestError", &ConversionMeasures::largestError},
-    {"sourceJitter", &ConversionMeasures::sourceJitter},
-    {"resultJitter", &ConversionMeasures::resultJitter},
-    {"jitterRatio",  &ConversionMeasures::jitterRatio },
-    {"contactF1",    &ConversionMeasures::contactF1   },
-    {"floorHeight",  &ConversionMeasures::floorHeight },
-    {"sinkDepth",    &ConversionMeasures::sinkDepth   },
-    {"sourceTravel", &ConversionMeasures::sourceTravel},
-    {"resultTravel", &ConversionMeasures::resultTravel},
-    {"travelRatio",  &ConversionMeasures::travelRatio },
+    {"frameCount",         &ConversionMeasures::frameCount        },
+    {"frameScale",         &ConversionMeasures::frameScale        },
+    {"sourceLeg",          &ConversionMeasures::sourceLeg         },
+    {"resultLeg",          &ConversionMeasures::resultLeg         },
+    {"meanError",          &ConversionMeasures::meanError         },
+    {"largestError",       &ConversionMeasures::largestError      },
+    {"trunkMean",          &ConversionMeasures::trunkMean         },
+    {"trunkMost",          &ConversionMeasures::trunkMost         },
+    {"trunkLargest",       &ConversionMeasures::trunkLargest      },
+    {"trunkFrame",         &ConversionMeasures::trunkFrame        },
+    {"jitterRatio",        &ConversionMeasures::jitterRatio       },
+    {"jitterRatioLargest", &ConversionMeasures::jitterRatioLargest},
+    {"ankleSlide",         &ConversionMeasures::ankleSlide        },
+    {"toeSlide",           &ConversionMeasures::toeSlide          },
+    {"contactF1",          &ConversionMeasures::contactF1         },
+    {"heldSole",           &ConversionMeasures::heldSole          },
+    {"sinkDepth",          &ConversionMeasures::sinkDepth         },
+    {"handGap",            &ConversionMeasures::handGap           },
+    {"handDepth",          &ConversionMeasures::handDepth         },
+    {"sourceTravel",       &ConversionMeasures::sourceTravel      },
+    {"resultTravel",       &ConversionMeasures::resultTravel      },
+    {"travelRatio",        &ConversionMeasures::travelRatio       },
 };
 
 void Write(CJsonWriter& json, double value)
@@ -111,6 +132,8 @@ void Write(CJsonWriter& json, const std::optional<double>& value)
         json.Null();
 }
 
+void Write(CJsonWriter& json, const SlideMeasures& slide);
+
 template <class Record, size_t count>
 void WriteFigures(CJsonWriter& json, const Record& record, const FigureRow<Record> (&rows)[count])
 {
@@ -119,6 +142,13 @@ void WriteFigures(CJsonWriter& json, const Record& record, const FigureRow<Recor
         json.Key(row.name);
         std::visit([&](auto member) { Write(json, record.*member); }, row.member);
     }
+}
+
+void Write(CJsonWriter& json, const SlideMeasures& slide)
+{
+    json.BeginObject();
+    WriteFigures(json, slide, kSlideFigures);
+    json.EndObject();
 }
 
 template <class Record, size_t count>
@@ -137,24 +167,31 @@ void WriteList(CJsonWriter& json, const char* name, const std::vector<Record>& r
     json.EndArray();
 }
 
-std::string Optional(const std::optional<double>& value)
+// The figure with its unit, or "none".
+std::string Optional(const std::optional<double>& value, int decimals = 3, const char* unit = "")
 {
-    char text[32];
-    std::snprintf(text, sizeof text, "%.3f", value.value_or(0.0));
+    char text[48];
+    std::snprintf(text, sizeof text, "%.*f%s", decimals, value.value_or(0.0), unit);
     return value ? text : "none";
+}
+
+std::string Slide(const SlideMeasures& slide)
+{
+    char text[96];
+    std::snprintf(text, sizeof text, "%.2f mm median, %.2f mm worst of %zu", slide.median, slide.largest,
+                  slide.plants);
+    return slide.plants > 0 ? text : "none";
 }
 
 void PrintBones(const ConversionMeasures& measures)
 {
-    std::printf("%-14s %-20s %10s %10s %8s %12s %12s\n", "bone", "source", "mean deg", "max deg", "at frame",
-                "jitter", "of source");
+    std::printf("%-14s %-20s %10s %10s %8s\n", "bone", "source", "mean deg", "max deg", "at frame");
     for (const BoneMeasures& bone : measures.bones)
     {
         if (!bone.measured)
             continue;
-        std::printf("%-14s %-20s %10.3f %10.3f %8d %12.6f %12.6f\n", Printable(bone.target).c_str(),
-                    Printable(bone.source).c_str(), bone.meanError, bone.largestError, bone.largestFrame,
-                    bone.resultJitter, bone.sourceJitter);
+        std::printf("%-14s %-20s %10.3f %10.3f %8d\n", Printable(bone.target).c_str(),
+                    Printable(bone.source).c_str(), bone.meanError, bone.largestError, bone.largestFrame);
     }
 }
 
@@ -163,11 +200,22 @@ void PrintFeet(const ConversionMeasures& measures, const char* indent)
     for (const FootMeasures& foot : measures.feet)
     {
         std::printf(
-            "%s%s: contacts %zu of %zu, F1 %s; added slide %.2f mm mean, %.2f mm max; turn %.2f deg mean; "
-            "sole %.2f deg mean; knee pops %zu\n",
-            indent, Printable(foot.target).c_str(), foot.resultContacts, foot.sourceContacts,
-            Optional(foot.contactF1).c_str(), foot.addedSlideMean, foot.addedSlideLargest, foot.turnError,
-            foot.soleTiltMean, foot.kneePops);
+            "%s%s: added slide of the ankle %s, of the toe %s; contacts %zu of %zu, F1 %s; turn %.2f deg "
+            "mean; sole %.2f deg mean; knee pops %zu\n",
+            indent, Printable(foot.target).c_str(), Slide(foot.ankleSlide).c_str(),
+            Slide(foot.toeSlide).c_str(), foot.resultContacts, foot.sourceContacts,
+            Optional(foot.contactF1).c_str(), foot.turnError, foot.soleTiltMean, foot.kneePops);
+    }
+}
+
+void PrintHands(const ConversionMeasures& measures, const char* indent)
+{
+    for (const HandMeasures& hand : measures.hands)
+    {
+        const std::string part = hand.gap ? " (" + hand.gapPart + ")" : "";
+        std::printf("%s%s: touches in %zu frames; gap %s%s; %.2f mm below the floor\n", indent,
+                    Printable(hand.target).c_str(), hand.touchFrames, Optional(hand.gap, 2, " mm").c_str(),
+                    part.c_str(), hand.depth);
     }
 }
 
@@ -177,11 +225,16 @@ void PrintSums(const ConversionMeasures& measures, const char* indent)
 {
     std::printf("%sdirections: %.3f deg mean, %.3f deg max, over %d frames\n", indent, measures.meanError,
                 measures.largestError, measures.frameCount);
+    std::printf("%strunk: %s mean, %s at 95 %%\n", indent, Optional(measures.trunkMean, 3, " deg").c_str(),
+                Optional(measures.trunkMost, 3, " deg").c_str());
     PrintFeet(measures, indent);
-    std::printf("%scontacts F1 %s; floor %s mm; sinks %.2f mm; travel ratio %s; jitter ratio %s\n", indent,
-                Optional(measures.contactF1).c_str(), Optional(measures.floorHeight).c_str(),
-                measures.sinkDepth, Optional(measures.travelRatio).c_str(),
-                Optional(measures.jitterRatio).c_str());
+    PrintHands(measures, indent);
+    std::printf(
+        "%scontacts F1 %s; held soles off the floor by %s; sinks %.2f mm; hip path ratio %s; leg jitter "
+        "ratio %s median, %s worst\n",
+        indent, Optional(measures.contactF1).c_str(), Optional(measures.heldSole, 2, " mm").c_str(),
+        measures.sinkDepth, Optional(measures.travelRatio).c_str(), Optional(measures.jitterRatio).c_str(),
+        Optional(measures.jitterRatioLargest).c_str());
 }
 
 void PrintMeasures(const ConversionMeasures& measures)
@@ -204,6 +257,7 @@ void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecor
     WriteFigures(json, measures, kFigures);
     WriteList(json, "bones", measures.bones, kBoneFigures, layout);
     WriteList(json, "feet", measures.feet, kFootFigures, layout);
+    WriteList(json, "hands", measures.hands, kHandFigures, layout);
 }
 
 } // namespace gw

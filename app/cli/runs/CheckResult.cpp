@@ -3,28 +3,11 @@
 #include "CFileConversion.h"
 #include "CKeyframeControl.h"
 #include "ConvertFile.h"
+#include "HTRPose.h"
 #include "ShellOptions.h"
-#include "Skeleton.h"
 #include "SourceTiming.h"
 
 namespace gw {
-
-namespace {
-
-// New tracks rest in the pose that the rules made of the source's rest; a saved result rests in the target's
-// own, and so is it measured.
-void TakeRestPose(const CMotionFile& result)
-{
-    for (const CNode* bone : NodesOf(*result.restRoot))
-    {
-        const CNode* const node = FindNode(result.motionRoot.Get(), bone->GetName());
-        CKeyframeControl* const track = node ? RecordCast<CKeyframeControl>(node->GetControl()) : nullptr;
-        if (track)
-            track->m_kRestMatrix = bone->m_kMatrix;
-    }
-}
-
-} // namespace
 
 MotionClip SourceClipOf(const CFileConversion& conversion)
 {
@@ -39,7 +22,7 @@ ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob&
     ConvertedMotion motion;
     motion.source = job.source;
     motion.result = job.output;
-    TakeRestPose(conversion.Result());
+    TakeWrittenPoses(conversion.Result());
     motion.sourceClip = SourceClipOf(conversion);
     motion.resultClip = ClipOf(conversion.Result());
     return motion;

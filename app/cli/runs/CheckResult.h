@@ -14,7 +14,7 @@ struct ShellOptions;
 MotionClip SourceClipOf(const CFileConversion& conversion);
 
 /// The source and the result of a conversion that is made, as clips of trees that live with it; named after
-/// the job. The result is saved already: its tracks take the target's rest pose.
+/// the job. The result is saved already: its tracks become what its file has of them.
 ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job);
 
 /// Compares source and result by the profile that the conversion used. Returns nothing if the profile can no

@@ -66,7 +66,7 @@ public:
     CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellReports& reports, Account& account,
               CPagePart* part)
         : options_(options), job_(job), reports_(reports), account_(account), m_pkPart(part),
-          m_kConversion(options, {options.align, options.faithful}, reports)
+          m_kConversion(options, {options.align, options.faithful, !options.noHands}, reports)
     {
     }
 

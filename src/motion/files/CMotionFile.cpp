@@ -83,7 +83,8 @@ CMotionFile::CMotionFile() = default;
 CMotionFile::~CMotionFile() = default;
 
 CMotionFile::CMotionFile(const CMotionFile& trees)
-    : restRoot(trees.restRoot), motionRoot(trees.motionRoot), fileVersion(trees.fileVersion)
+    : restRoot(trees.restRoot), motionRoot(trees.motionRoot), fileVersion(trees.fileVersion),
+      quarterTurns(trees.quarterTurns)
 {
 }
 

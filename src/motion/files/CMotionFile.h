@@ -4,6 +4,7 @@
 #include "CFailure.h"
 #include "CNode.h"
 #include "CTextLines.h"
+#include "HTRPose.h"
 
 #include <functional>
 #include <string>
@@ -19,7 +20,8 @@ class CMotionFile
 {
 public:
     CMotionFile();
-    /// Shares the other file's trees and version, for a writer.
+    /// Shares the other file's trees, and takes its version and its way of writing quarter turns, for a
+    /// writer.
     CMotionFile(const CMotionFile& trees);
     CMotionFile& operator=(const CMotionFile&) = delete;
     virtual ~CMotionFile();
@@ -46,6 +48,7 @@ public:
     Ref<CNode> restRoot;   ///< the rest pose, without controls; HTR files only
     Ref<CNode> motionRoot; ///< the animated tree
     int fileVersion = 1;
+    EQuarterTurns quarterTurns = EQuarterTurns::Flipped; ///< how Save writes them
 
 protected:
     /// Maps a text file and rewinds. Returns false for an empty path or a file that cannot be read.

@@ -12,6 +12,7 @@
 #include "CMotionSampler.h"
 #include "CTrackSampler.h"
 #include "Euler.h"
+#include "HTRPose.h"
 #include "Skeleton.h"
 #include "TKHTRFile.h"
 #include "TKHTRStream.h"
@@ -28,16 +29,9 @@ constexpr float kFrameLimit = 1 << 24;             // larger frame numbers are n
 constexpr size_t kRowBytesLimit = size_t{1} << 31; // for stored rows
 constexpr size_t kNoNode = std::numeric_limits<size_t>::max();
 
-// Only the root has a translation.
-HTRRow RowOf(const Mat4& local, bool isRoot, const TKHTRSegment& segment)
+HTRBase BaseOf(const TKHTRSegment& segment)
 {
-    const double length = Vec3Length(local.Row(0));
-    HTRRow row;
-    if (isRoot)
-        row.translation = local.Translation() - segment.baseTranslation;
-    row.degrees = RowsToEulerDegrees(local, length) - segment.baseRotation;
-    row.scale = static_cast<float>(length);
-    return row;
+    return {segment.baseTranslation, segment.baseRotation};
 }
 
 void AddSegments(const CNode& node, std::string_view parentName, TKHTRFile& file)
@@ -85,8 +79,8 @@ std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
 class CRows
 {
 public:
-    CRows(const TKHTRFile& file, CNode& motion, std::vector<float> times)
-        : file_(file), m_kTimes(std::move(times)), m_kSampler(motion),
+    CRows(const TKHTRFile& file, CNode& motion, EQuarterTurns quarterTurns, std::vector<float> times)
+        : file_(file), m_eQuarterTurns(quarterTurns), m_kTimes(std::move(times)), m_kSampler(motion),
           m_kNodeOfSegment(NodesOfSegments(file, m_kSampler.Nodes()))
     {
     }
@@ -127,12 +121,13 @@ private:
     void WriteSampled(CLineWriter& out, size_t segment, const CKeyframeControl& track) const
     {
         const bool isRoot = !m_kSampler.Nodes()[m_kNodeOfSegment[segment]]->GetParent();
+        const HTRBase base = BaseOf(*file_.segments[segment]);
         CTrackSampler sampler(track);
         CHTRRowText text;
         for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
         {
             if (sampler.MoveTo(m_kTimes[frame]))
-                text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, *file_.segments[segment]));
+                text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, base, m_eQuarterTurns));
             else
                 text.Repeat(out, NumberOf(frame));
         }
@@ -153,10 +148,11 @@ private:
         if (index == kNoNode)
             return {};
         const CNode& node = *m_kSampler.Nodes()[index];
-        return RowOf(node.m_kMatrix, !node.GetParent(), *file_.segments[segment]);
+        return RowOf(node.m_kMatrix, !node.GetParent(), BaseOf(*file_.segments[segment]), m_eQuarterTurns);
     }
 
     const TKHTRFile& file_;
+    EQuarterTurns m_eQuarterTurns;
     std::vector<float> m_kTimes;
     CMotionSampler m_kSampler;
     std::vector<size_t> m_kNodeOfSegment;
@@ -227,6 +223,19 @@ void WriteRows(CLineWriter& out, const TKHTRFile& file, CRows& rows)
     }
 }
 
+// What writes the whole text, as long as the arguments live.
+std::function<bool(CLineWriter&)> TextOf(const TKHTRFile& file, CRows& rows, CFailureRecord& record)
+{
+    return [&](CLineWriter& out) {
+        if (!rows.Prepare())
+            return record.Fail(EFailure::TooLarge);
+        WriteHeader(out, file);
+        WriteSegments(out, file);
+        WriteRows(out, file, rows);
+        return true;
+    };
+}
+
 } // namespace
 
 bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
@@ -274,15 +283,8 @@ bool TKHTRStream::SaveTo(const T& destination, float frameScale)
     AddSegments(*restRoot, "GLOBAL", file);
     SwitchControls(*motionRoot, true);
 
-    CRows rows(file, *motionRoot, FrameTimes(file.numFrames, GetFrequency(), frameScale));
-    const bool written = WriteLines(destination, [&](CLineWriter& out) {
-        if (!rows.Prepare())
-            return m_kRecord.Fail(EFailure::TooLarge);
-        WriteHeader(out, file);
-        WriteSegments(out, file);
-        WriteRows(out, file, rows);
-        return true;
-    });
+    CRows rows(file, *motionRoot, quarterTurns, FrameTimes(file.numFrames, GetFrequency(), frameScale));
+    const bool written = WriteLines(destination, TextOf(file, rows, m_kRecord));
     motionRoot->UpdateScene(0.0f, true);
     return written;
 }

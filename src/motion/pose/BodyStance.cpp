@@ -70,6 +70,18 @@ ERestPose BodyStance::Verdict() const
     return *armsSide <= kMostOfAPose ? ERestPose::APose : ERestPose::Other;
 }
 
+// Limits in degrees: an A-pose spreads its legs by 20, and joints lie beside the bones' real ends.
+bool BodyStance::IsReference() const
+{
+    constexpr double kTrunkLimit = 40.0;
+    constexpr double kLegLimit = 40.0;
+    constexpr double kShoulderLimit = 35.0;
+    constexpr double kFootLimit = 70.0;
+    return left != kVec3Zero && AngleBetween(up, NearestAxis(up)) < kTrunkLimit &&
+           thighs.value_or(180.0) < kLegLimit && shins.value_or(180.0) < kLegLimit &&
+           shoulders.value_or(0.0) < kShoulderLimit && feet < kFootLimit;
+}
+
 bool BodyStance::Stands() const
 {
     return thighs && *thighs <= kMostOfStance;

@@ -40,6 +40,9 @@ struct BodyStance
     ERestPose Verdict() const;
     /// Whether the legs are those of a standing body, wherever its arms are.
     bool Stands() const;
+    /// Whether the turns of bones can be measured in it: the legs continue the trunk, and shoulders and feet
+    /// face the same way as the hips.
+    bool IsReference() const;
 };
 
 /// Returns a joint's world position in a pose.

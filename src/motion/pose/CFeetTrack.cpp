@@ -10,6 +10,11 @@ namespace gw {
 
 namespace {
 
+// Up to the first height over its floor, in leg lengths, a joint that stands has its sole on the floor; from
+// the second on it hovers.
+constexpr double kLowHeight = 0.02;
+constexpr double kHoverHeight = 0.05;
+
 // The height on which a joint of all feet stands.
 float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const)
 {
@@ -40,6 +45,12 @@ void CFeetTrack::Append()
         leg.Append();
 }
 
+void CFeetTrack::AppendPlaces()
+{
+    for (CLegTrack& leg : m_kLegs)
+        leg.AppendPlaces();
+}
+
 void CFeetTrack::MeasureLegs()
 {
     CRunningMean lengths;
@@ -63,6 +74,45 @@ std::vector<std::vector<Contact>> CFeetTrack::Contacts(double secondsPerFrame) c
         contacts.push_back(FindContacts(joints, m_fLegLength, secondsPerFrame));
     }
     return contacts;
+}
+
+FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, const std::vector<Contact>& flat, float ankleFloor,
+                                  float toeFloor, double secondsPerFrame) const
+{
+    const FloorPath ankle{leg.Ankles(), ankleFloor};
+    const FloorPath toe{leg.HasToe() ? leg.Toes() : leg.Ankles(), leg.HasToe() ? toeFloor : ankleFloor};
+    FootTouches touches{MergedContacts(FindContacts({&ankle, 1}, m_fLegLength, secondsPerFrame),
+                                       FindContacts({&toe, 1}, m_fLegLength, secondsPerFrame)),
+                        std::vector<float>(ankle.positions.size(), 0.0f)};
+    for (const Contact& contact : touches.contacts)
+    {
+        double height = kHoverHeight;
+        for (auto frame = static_cast<size_t>(contact.first); frame < static_cast<size_t>(contact.end);
+             ++frame)
+        {
+            const float above =
+                std::min(ankle.positions[frame].y - ankleFloor, toe.positions[frame].y - toe.floor);
+            height = std::min(height, static_cast<double>(above) / m_fLegLength);
+        }
+        const bool isFlat = std::ranges::any_of(flat, [&](const Contact& other) {
+            return contact.first <= other.first && other.end <= contact.end;
+        });
+        const double hovers = isFlat ? 0.0 : Smoothstep((height - kLowHeight) / (kHoverHeight - kLowHeight));
+        std::fill(touches.landed.begin() + contact.first, touches.landed.begin() + contact.end,
+                  static_cast<float>(1.0 - hovers));
+    }
+    return touches;
+}
+
+std::vector<FootTouches> CFeetTrack::Touches(double secondsPerFrame) const
+{
+    const float ankleFloor = FloorOf(m_kLegs, &CLegTrack::Ankles);
+    const float toeFloor = FloorOf(m_kLegs, &CLegTrack::Toes);
+    const std::vector<std::vector<Contact>> flat = Contacts(secondsPerFrame);
+    std::vector<FootTouches> touches;
+    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+        touches.push_back(TouchesOf(m_kLegs[leg], flat[leg], ankleFloor, toeFloor, secondsPerFrame));
+    return touches;
 }
 
 } // namespace gw

@@ -9,6 +9,17 @@ namespace gw {
 
 class CPoseSampler;
 
+/// The touches of one foot.
+struct FootTouches
+{
+    /// Frames in which the ankle or the toe stands, whatever the other does: a heel that has come down, a
+    /// ball that pushes off.
+    std::vector<Contact> contacts;
+    /// How surely the sole is on the floor, 0 to 1, frame by frame: 1 where ankle and toe stand together;
+    /// less where one alone does and hovers.
+    std::vector<float> landed;
+};
+
 /// The feet of one skeleton while frames go by.
 class CFeetTrack
 {
@@ -18,6 +29,8 @@ public:
     void WatchJoints(CPoseSampler& sampler) const;
     /// Takes the present pose as the next frame.
     void Append();
+    /// The same for ankles and toes alone: what contacts are found by.
+    void AppendPlaces();
     /// Takes the present pose for how long the legs are.
     void MeasureLegs();
 
@@ -27,8 +40,13 @@ public:
     double LegLength() const { return m_fLegLength; }
     /// The contacts of each leg.
     std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
+    /// What each leg touches the floor with.
+    std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:
+    FootTouches TouchesOf(const CLegTrack& leg, const std::vector<Contact>& flat, float ankleFloor,
+                          float toeFloor, double secondsPerFrame) const;
+
     std::vector<CLegTrack> m_kLegs;
     double m_fLegLength = 0.0;
 };

@@ -49,14 +49,19 @@ float CLegTrack::SoleHeight() const
     return HasToe() ? std::min(heel, TransformCoord(m_kToeSole, m_kJoints.toe->m_kWorldMatrix).y) : heel;
 }
 
+void CLegTrack::AppendPlaces()
+{
+    m_kAnkles.push_back(PlaceOf(*m_kJoints.ankle));
+    if (HasToe())
+        m_kToes.push_back(PlaceOf(*m_kJoints.toe));
+}
+
 void CLegTrack::Append()
 {
+    AppendPlaces();
     const Vec3 knee = PlaceOf(*m_kJoints.knee);
     const Vec3 ankle = PlaceOf(*m_kJoints.ankle);
     const Vec3 normal = Turned(m_kSoleNormal, NormalizedRows(m_kJoints.ankle->m_kWorldMatrix));
-    m_kAnkles.push_back(ankle);
-    if (HasToe())
-        m_kToes.push_back(PlaceOf(*m_kJoints.toe));
     m_kPostures.push_back({Heading(), static_cast<float>(AngleBetween(normal, kVec3UnitY)), SoleHeight(),
                            static_cast<float>(AngleBetween(knee - PlaceOf(*m_kJoints.thigh), ankle - knee))});
 }

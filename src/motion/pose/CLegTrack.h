@@ -46,6 +46,8 @@ public:
     void SetHeading(const Vec3& direction);
     /// Takes the present pose as the next frame.
     void Append();
+    /// The same without a posture.
+    void AppendPlaces();
 
     const std::vector<Vec3>& Ankles() const { return m_kAnkles; }
     /// One a frame; none for a foot without a toe joint.

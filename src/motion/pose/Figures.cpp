@@ -15,6 +15,12 @@ float Percentile(std::vector<float> values, double share)
     return *rank;
 }
 
+double Smoothstep(double x)
+{
+    x = std::clamp(x, 0.0, 1.0);
+    return x * x * (3.0 - 2.0 * x);
+}
+
 double GroundDistance(const Vec3& a, const Vec3& b)
 {
     return std::hypot(static_cast<double>(a.x - b.x), static_cast<double>(a.z - b.z));

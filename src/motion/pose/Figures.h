@@ -41,10 +41,18 @@ inline std::optional<double> RatioOf(double result, double source, double least 
     return source > least ? std::optional(result / source) : std::nullopt;
 }
 
+/// 0 at and below 0, 1 at and above 1, and smooth in between.
+double Smoothstep(double x);
+
 /// The nearest-rank percentile: the value below which a share (0 to 1) of the values lies. 0 if there are no
 /// values. Values that are not finite are ignored.
 float Percentile(std::vector<float> values, double share);
 
+/// The horizontal part of a way: in x and z only.
+inline Vec3 OverGround(const Vec3& way)
+{
+    return {way.x, 0.0f, way.z};
+}
 /// The horizontal distance of two points: in x and z only.
 double GroundDistance(const Vec3& a, const Vec3& b);
 

@@ -76,4 +76,19 @@ std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg,
     return contacts;
 }
 
+std::vector<Contact> MergedContacts(std::vector<Contact> contacts, const std::vector<Contact>& more)
+{
+    contacts.insert(contacts.end(), more.begin(), more.end());
+    std::ranges::sort(contacts, {}, &Contact::first);
+    std::vector<Contact> merged;
+    for (const Contact& contact : contacts)
+    {
+        if (merged.empty() || merged.back().end < contact.first)
+            merged.push_back(contact);
+        else
+            merged.back().end = std::max(merged.back().end, contact.end);
+    }
+    return merged;
+}
+
 } // namespace gw

@@ -42,4 +42,7 @@ struct FloorPath
 /// length. `leg` is in the unit of the positions and above 0.
 std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg, double secondsPerFrame);
 
+/// The frames of two lists of contacts together, in order; contacts that meet or overlap become one.
+std::vector<Contact> MergedContacts(std::vector<Contact> contacts, const std::vector<Contact>& more);
+
 } // namespace gw

@@ -104,10 +104,11 @@ Vec3 CFaithfulLeg::Stretch(size_t frame) const
     return at.thigh * static_cast<float>(m_kLengths.upper) + at.shin * static_cast<float>(m_kLengths.lower);
 }
 
-double CFaithfulLeg::KneeAngle(size_t frame) const
+double CFaithfulLeg::KneeBend(size_t frame) const
 {
     const Frame& at = m_kFrames[frame];
-    return std::atan2(Vec3Length(Vec3Cross(at.thigh, at.shin)), Vec3Dot(at.thigh, at.shin));
+    const Vec3 off = at.thigh - at.shin; // the chord of the angle between unit vectors
+    return std::min(0.5 * Vec3Length(off), 1.0);
 }
 
 Vec3 CFaithfulLeg::Forward(const CPoseMatcher& matcher) const

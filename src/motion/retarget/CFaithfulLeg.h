@@ -40,8 +40,8 @@ public:
     const LegLengths& Lengths() const { return m_kLengths; }
     /// From hip to ankle where thigh and calf point as the source's.
     Vec3 Stretch(size_t frame) const;
-    /// The angle of the source's knee in radians, 0 for a straight leg.
-    double KneeAngle(size_t frame) const;
+    /// The bend of the source's knee; see YieldKnee.h.
+    double KneeBend(size_t frame) const;
     /// Where the knee stands off the line from hip to ankle, mostly: a direction in the world, not unit.
     Vec3 Forward(const CPoseMatcher& matcher) const;
 

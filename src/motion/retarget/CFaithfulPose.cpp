@@ -4,6 +4,7 @@
 #include "Directions.h"
 #include "HostBones.h"
 #include "JointSteps.h"
+#include "PointBone.h"
 #include "Skeleton.h"
 
 #include <cmath>
@@ -55,39 +56,29 @@ bool IsFinite(const Vec3& v)
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
 }
 
-// LeastSwing of unit directions, with an axis that is rounded as results have always had it.
-Mat3 SwingBetween(const Vec3& from, const Vec3& to)
-{
-    const Vec3 across = Vec3Cross(from, to);
-    const double sine = Vec3Length(across);
-    if (sine == 0.0)
-        return LeastSwing(from, to);
-    return Mat3FromAxisAngle(across * static_cast<float>(1.0 / sine),
-                             static_cast<float>(std::atan2(sine, Vec3Dot(from, to))));
-}
-
-// A bone's world rotation, turned the least way so that its joint below lies in a direction.
-Mat3 PointedTo(const Vec3& direction, const Mat3& bone, const Vec3& jointBelow)
-{
-    return bone * SwingBetween(Vec3Normalized(Turned(jointBelow, bone)), Vec3Normalized(direction));
-}
-
 } // namespace
 
-CFaithfulPose::CFaithfulPose(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot)
-    : matcher_(matcher), m_kLegs(PlanLegs(retargeter, matcher, targetRoot)),
-      m_kSource(retargeter.SourceOf(targetRoot), SourcesOf(m_kLegs)), m_kSolver(m_kLegs.size())
+CFaithfulPose::CFaithfulPose(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot,
+                             bool holdHands)
+    : matcher_(matcher), m_kTrunk(retargeter, matcher, targetRoot),
+      m_kLegs(PlanLegs(retargeter, matcher, targetRoot)),
+      m_kSource(retargeter.SourceOf(targetRoot), SourcesOf(m_kLegs)),
+      m_kHands(retargeter, matcher, holdHands ? targetRoot : nullptr, m_kLegs)
 {
-    for (size_t k = 0; k < m_kLegs.size(); ++k)
-    {
-        const LegLengths& leg = m_kLegs[k].Lengths();
-        m_kSolver.SetLimb(k, {0.0f, static_cast<float>(leg.upper), 0.0f},
-                          {0.0f, static_cast<float>(leg.lower), 0.0f}, kVec3UnitZ, kVec3UnitX);
-    }
+}
+
+std::vector<CNode*> CFaithfulPose::SourceJoints() const
+{
+    std::vector<CNode*> joints = m_kSource.Joints();
+    for (const std::vector<CNode*>& more : {m_kTrunk.Joints(), m_kHands.Joints()})
+        joints.insert(joints.end(), more.begin(), more.end());
+    return joints;
 }
 
 void CFaithfulPose::Append()
 {
+    m_kTrunk.Aim(matcher_);
+    m_kHands.Append();
     m_kSource.Append();
     for (CFaithfulLeg& leg : m_kLegs)
         leg.AppendSource();
@@ -130,20 +121,25 @@ void CFaithfulPose::WriteFrame(size_t frame, const std::vector<CKeyframeControl*
         WriteLeg(leg, frame, tracks);
 }
 
-// The knee's place from the hip, in the plane of the source's. False where the ankle cannot be reached.
-bool CFaithfulPose::SolveKnee(size_t k, size_t frame, const Vec3& ankle, Vec3& knee)
+void CFaithfulPose::PlanHands(const std::vector<CKeyframeControl*>& tracks, double secondsPerFrame)
+{
+    m_kHands.Plan(
+        tracks, [this](const Vec3& place) { return plan_->OnTarget(place); }, secondsPerFrame,
+        plan_->HasFloor());
+}
+
+void CFaithfulPose::WriteHands(size_t frame, const std::vector<CKeyframeControl*>& tracks)
+{
+    m_kHands.WriteFrame(frame, tracks);
+}
+
+// The knee's place from the hip, in the plane of the source's.
+Vec3 CFaithfulPose::KneePlace(size_t k, size_t frame, const Vec3& ankle) const
 {
     const CFaithfulLeg& leg = m_kLegs[k];
     const Vec3 sourceKnee = leg.At(frame).thigh * static_cast<float>(leg.Lengths().upper);
     const Vec3 forward = Vec3Normalized(leg.Forward(matcher_)) * kForwardHint;
-    Vec3 hint = TransformCoord(sourceKnee + forward, AxisSwapForward);
-    Mat4 goal = kMat4Identity;
-    goal.SetTranslation(TransformCoord(ankle, AxisSwapForward));
-    CLegSolver::Pose pose;
-    if (!m_kSolver.Solve(k, hint, goal, pose))
-        return false;
-    knee = TransformCoord(hint, AxisSwapBack);
-    return true;
+    return MiddleJoint(leg.Lengths(), ankle, sourceKnee + forward);
 }
 
 void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframeControl*>& tracks)
@@ -152,8 +148,8 @@ void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframe
     const auto& bones = matcher_.Bones();
     const auto worldOf = [&](size_t bone) { return NormalizedRows(bones[bone].world); };
     const Vec3 ankle = plan_->Ankle(k, frame);
-    Vec3 knee;
-    if (!IsFinite(ankle) || !SolveKnee(k, frame, ankle, knee))
+    const Vec3 knee = KneePlace(k, frame, ankle);
+    if (!IsFinite(ankle) || !IsFinite(knee))
         return;
 
     const int above = bones[leg.Thigh()].parent;

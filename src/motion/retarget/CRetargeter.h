@@ -76,9 +76,11 @@ public:
     bool Retarget(float begin, float last, float phase, float frequency, const Vec3& rootPosition,
                   bool resetOrigin, bool useLegs);
 
-    /// If set, later runs keep hips, knees and feet close to the source (CFaithfulPose), for legs that are
-    /// mapped from thigh to foot. `useLegs` then decides whether planted feet are held in place.
+    /// If set, later runs keep trunk, hips, knees and feet close to the source (CFaithfulPose), for legs that
+    /// are mapped from thigh to foot. `useLegs` then decides whether planted feet are held in place.
     void SetFaithful(bool faithful) { m_bFaithful = faithful; }
+    /// Whether such runs also keep the gaps of hands to what they touch; on by default.
+    void SetHoldHands(bool hold) { m_bHoldHands = hold; }
 
     /// Sets a callback that a run calls periodically with the number of frames done and the total.
     void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
@@ -111,6 +113,7 @@ private:
     CNode* m_pkSourceRoot = nullptr;
     CNode* m_pkTargetRoot = nullptr;
     bool m_bFaithful = false;
+    bool m_bHoldHands = true;
     bool m_bPlainTurns = false;
     CFailureRecord m_kRecord;
     std::function<void(size_t, size_t)> progress_;

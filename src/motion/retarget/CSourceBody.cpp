@@ -29,7 +29,7 @@ void CSourceBody::Append()
 {
     if (m_kRoots.empty())
         m_kFeet.MeasureLegs();
-    m_kFeet.Append();
+    m_kFeet.AppendPlaces();
     m_kRoots.push_back(m_pkRoot ? m_pkRoot->m_kWorldMatrix.Translation() : kVec3Zero);
     Vec3 hips = kVec3Zero;
     for (const LegJoints& leg : m_kLegs)
@@ -37,11 +37,21 @@ void CSourceBody::Append()
     m_kHips.push_back(hips);
 }
 
+bool CSourceBody::HasLegs() const
+{
+    return LegLength() > 0.0 && std::isfinite(LegLength());
+}
+
 std::vector<std::vector<Contact>> CSourceBody::Contacts(double secondsPerFrame) const
 {
-    if (!(LegLength() > 0.0) || !std::isfinite(LegLength()))
-        return std::vector<std::vector<Contact>>(m_kLegs.size());
-    return m_kFeet.Contacts(secondsPerFrame);
+    return HasLegs() ? m_kFeet.Contacts(secondsPerFrame) : std::vector<std::vector<Contact>>(m_kLegs.size());
+}
+
+std::vector<FootTouches> CSourceBody::Touches(double secondsPerFrame) const
+{
+    if (HasLegs())
+        return m_kFeet.Touches(secondsPerFrame);
+    return std::vector<FootTouches>(m_kLegs.size(), {{}, std::vector<float>(FrameCount(), 0.0f)});
 }
 
 } // namespace gw

@@ -30,8 +30,12 @@ public:
     const CLegTrack& Leg(size_t leg) const { return m_kFeet.Legs()[leg]; }
     /// The contacts of each leg; none where legs have no length.
     std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
+    /// What each leg touches the floor with; nothing where legs have no length.
+    std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:
+    bool HasLegs() const;
+
     const CNode* m_pkRoot;
     std::vector<LegJoints> m_kLegs;
     CFeetTrack m_kFeet;

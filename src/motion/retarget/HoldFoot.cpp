@@ -1,6 +1,27 @@
+// A foot that stands does so on its heel first, then flat, then on the ball while the heel comes up. On a
+// foot of another length ankle and toe cannot both do as the source's. With va and vt the speeds of the two
+// in the source, each asks for its own steps with the weight 1 / (v^2 + e^2), where e is a speed at which a
+// foot just stands. By least squares the point at the share
+//
+//     u = (va^2 + e^2) / (va^2 + vt^2 + 2 e^2)
+//
+// of the way from ankle to toe goes as the source's does: it is at the one that stands, and between them
+// while both do. What the way from ankle to toe changes by then turns the foot about it.
+//
+// The source's foot may drift while it stands: sensors do, and feet are dragged. That is told at the point
+// with a small e, which does not move where a foot rolls. Little of it is taken away, much is kept.
+//
+// So contacts tell the ankle's steps, not its places. The places follow by least squares over all frames:
+// contacts' steps, little way off the free path, no sudden change of that way. One solution gives each
+// contact its place and the swing between two contacts its blend. A source whose hips shake keeps that in its
+// feet: a foot held still below them would make the legs shake instead.
+
 #include "HoldFoot.h"
 
-#include "Play.h"
+#include "Angles.h"
+#include "CBandFit.h"
+#include "Figures.h"
+#include "SmoothCurve.h"
 
 #include <algorithm>
 #include <cmath>
@@ -9,106 +30,153 @@ namespace gw {
 
 namespace {
 
-// How much of a fade lies outside of the contact. A foot that is held before the source's stands, or longer,
-// stands in more frames than the source's.
-constexpr double kOutside = 0.25;
+// Leg lengths a second.
 
-double Smoothstep(double x)
+constexpr double kStillSpeed = 0.1; // of one that stands for sure
+constexpr double kDriftSpeed = 0.2; // of a foot that moves, and does not drift
+
+constexpr double kSpeedBlend = 0.05;  // seconds over which the pivot's share is smoothed
+constexpr double kDriftShare = 0.02;  // of a leg: half of a drift so long is kept
+constexpr double kHoldSeconds = 10.0; // a foot that is held off its free path creeps back in as long
+constexpr double kShakeHertz = 6.0; // what hips, legs and feet shake by faster, nobody takes out of the foot
+
+Vec3 Between(const Vec3& a, const Vec3& b, double share)
 {
-    x = std::clamp(x, 0.0, 1.0);
-    return x * x * (3.0 - 2.0 * x);
+    return a + (b - a) * static_cast<float>(share);
 }
 
-// One end of a contact: the fade goes from `outer` (not held) to `inner` (held), in frames from the end
-// inward.
-struct Fade
+// The speed of a joint in leg lengths a second, frame by frame.
+std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secondsPerFrame)
 {
-    double outer;
-    double inner;
-
-    double Share(double framesInward) const
+    std::vector<float> speeds;
+    for (size_t frame = 0; frame < path.size(); ++frame)
     {
-        return inner <= outer ? 1.0 : Smoothstep((framesInward - outer) / (inner - outer));
+        const size_t before = frame > 0 ? frame - 1 : 0;
+        const size_t after = std::min(frame + 1, path.size() - 1);
+        const double seconds = static_cast<double>(std::max<size_t>(after - before, 1)) * secondsPerFrame;
+        const double speed = Vec3Length(path[after] - path[before]) / (seconds * leg);
+        speeds.push_back(std::isfinite(speed) ? static_cast<float>(speed) : 0.0f);
     }
+    SmoothCurve(speeds, kSpeedBlend / secondsPerFrame);
+    return speeds;
+}
+
+// The pivots of one foot and what they do.
+class CPivot
+{
+public:
+    CPivot(const FootPaths& foot, double secondsPerFrame)
+        : foot_(foot), m_kAnkle(SpeedsOf(foot.sourceAnkle, foot.leg, secondsPerFrame)),
+          m_kToe(SpeedsOf(foot.sourceToe, foot.leg, secondsPerFrame))
+    {
+    }
+    /// The share of the way from ankle to toe from a frame to the next one, for a speed e.
+    double Share(size_t frame, double still) const
+    {
+        return 0.5 * (ShareAt(frame, still) + ShareAt(frame + 1, still));
+    }
+    /// The source's step from a frame to the next one, over the ground, at a share of the way to the toe.
+    Vec3 Step(size_t frame, double share) const
+    {
+        return OverGround(Between(foot_.sourceAnkle[frame + 1] - foot_.sourceAnkle[frame],
+                                  foot_.sourceToe[frame + 1] - foot_.sourceToe[frame], share));
+    }
+    /// How far the source's foot has drifted in each frame of a contact since the first.
+    std::vector<Vec3> Drift(const Contact& contact) const;
+    /// Where it was in the frames in which it was slowest, on the whole.
+    Vec3 Middle(const Contact& contact, const std::vector<Vec3>& drift) const;
+
+private:
+    double ShareAt(size_t frame, double still) const
+    {
+        const double ankle = std::pow(static_cast<double>(m_kAnkle[frame]), 2.0) + still * still;
+        const double toe = std::pow(static_cast<double>(m_kToe[frame]), 2.0) + still * still;
+        return ankle / (ankle + toe);
+    }
+
+    const FootPaths& foot_;
+    std::vector<float> m_kAnkle;
+    std::vector<float> m_kToe;
 };
 
-// `gap` is the number of frames to the next contact, or to the end of the motion.
-Fade FadeOf(double gap, double length, double fadeFrames)
+std::vector<Vec3> CPivot::Drift(const Contact& contact) const
 {
-    return {-std::min(kOutside * fadeFrames, 0.5 * gap) - 0.5,
-            std::min((1.0 - kOutside) * fadeFrames, 0.5 * length) - 0.5};
+    std::vector<Vec3> drift{kVec3Zero};
+    for (auto frame = static_cast<size_t>(contact.first); frame + 1 < static_cast<size_t>(contact.end);
+         ++frame)
+        drift.push_back(drift.back() + Step(frame, Share(frame, kStillSpeed)));
+    return drift;
 }
 
-// A motion that begins or ends in a contact has no end there.
-constexpr Fade kNoFade{0.0, -1.0};
-
-// One contact with its fades.
-struct Hold
+Vec3 CPivot::Middle(const Contact& contact, const std::vector<Vec3>& drift) const
 {
-    Contact contact;
-    Fade start;
-    Fade end;
-
-    int First() const { return contact.first + static_cast<int>(std::floor(std::min(start.outer, 0.0))); }
-    int Behind() const { return contact.end - static_cast<int>(std::floor(std::min(end.outer, 0.0))); }
-    double Share(int frame) const
-    {
-        return std::min(start.Share(frame - contact.first), end.Share(contact.end - 1 - frame));
-    }
-};
-
-Hold MakeHold(std::span<const Contact> contacts, size_t index, int frameCount, double fadeFrames)
-{
-    const Contact& contact = contacts[index];
-    const int before = index == 0 ? 0 : contacts[index - 1].end;
-    const int after = index + 1 == contacts.size() ? frameCount : contacts[index + 1].first;
-    const double length = contact.end - contact.first;
-    return {contact, contact.first == 0 ? kNoFade : FadeOf(contact.first - before, length, fadeFrames),
-            contact.end == frameCount ? kNoFade : FadeOf(after - contact.end, length, fadeFrames)};
-}
-
-// The mean of a path over the ground, by the shares.
-Vec3 MiddleOf(const Hold& hold, std::span<const Vec3> path)
-{
-    double x = 0.0;
-    double z = 0.0;
+    Vec3 sum = kVec3Zero;
     double total = 0.0;
-    for (int frame = hold.contact.first; frame < hold.contact.end; ++frame)
+    for (size_t i = 0; i < drift.size(); ++i)
     {
-        const Vec3& place = path[static_cast<size_t>(frame)];
-        const double share = hold.Share(frame);
-        x += share * static_cast<double>(place.x);
-        z += share * static_cast<double>(place.z);
-        total += share;
+        const size_t frame = static_cast<size_t>(contact.first) + i;
+        const auto speed = static_cast<double>(std::min(m_kAnkle[frame], m_kToe[frame]));
+        const double weight = 1.0 / (kDriftSpeed * kDriftSpeed + speed * speed);
+        sum = sum + drift[i] * static_cast<float>(weight);
+        total += weight;
     }
-    return {static_cast<float>(x / total), 0.0f, static_cast<float>(z / total)};
+    return sum * static_cast<float>(1.0 / total);
+}
+
+// What is kept of a drift: little of a short one and nearly all of a long one, without a corner between.
+Vec3 KeptOf(const Vec3& drift, double play)
+{
+    const double square = Vec3Dot(drift, drift);
+    return drift * static_cast<float>(square / (square + play * play));
+}
+
+// What is taken away of a drift's step; nothing of a fast one.
+Vec3 Lost(const Vec3& from, const Vec3& to, double leg, double secondsPerFrame)
+{
+    const double play = kDriftShare * leg;
+    const double speed = Vec3Length(to - from) / (secondsPerFrame * leg * kDriftSpeed);
+    return (to - from - (KeptOf(to, play) - KeptOf(from, play))) *
+           static_cast<float>(1.0 / (1.0 + speed * speed));
 }
 
 } // namespace
 
-std::vector<FootHold> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double play,
-                               double fadeFrames)
+std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame)
 {
-    std::vector<FootHold> holds(foot.path.size());
-    const auto scale = static_cast<float>(foot.scale);
-    const auto frameCount = static_cast<int>(foot.path.size());
-    for (size_t i = 0; i < contacts.size(); ++i)
+    const CPivot pivot(foot, secondsPerFrame);
+    const double bend = BendWeight(kReturnHertz, secondsPerFrame);
+    const double stepWeight = std::pow(kHoldSeconds / secondsPerFrame, 2.0);
+    const double shakeWeight = stepWeight * std::pow(kTwoPi64 * kShakeHertz * secondsPerFrame, -2.0);
+    CBandFit x(foot.free.size(), bend, 1.0);
+    CBandFit z(foot.free.size(), bend, 1.0);
+    for (const Contact& contact : contacts)
     {
-        const Hold hold = MakeHold(contacts, i, frameCount, fadeFrames);
-        const Vec3 place = MiddleOf(hold, foot.path);
-        const Vec3 middle = MiddleOf(hold, foot.source);
-        for (int frame = std::max(hold.First(), 0); frame < std::min(hold.Behind(), frameCount); ++frame)
+        const std::vector<Vec3> drift = pivot.Drift(contact);
+        const Vec3 middle = pivot.Middle(contact, drift);
+        for (size_t i = 0; i + 1 < drift.size(); ++i)
         {
-            FootHold& present = holds[static_cast<size_t>(frame)];
-            const auto share = static_cast<float>(hold.Share(frame));
-            if (share <= present.share)
-                continue;
-            Vec3 drift = (foot.source[static_cast<size_t>(frame)] - middle) * scale;
-            drift.y = 0.0f;
-            present = {share, place + BeyondPlay(drift, play)};
+            const size_t frame = static_cast<size_t>(contact.first) + i;
+            const double share = pivot.Share(frame, kStandSpeed);
+            const Vec3 rolled = (foot.toe[frame + 1] - foot.toe[frame]) * static_cast<float>(share);
+            const Vec3 step = pivot.Step(frame, share) -
+                              Lost(drift[i] - middle, drift[i + 1] - middle, foot.leg, secondsPerFrame) -
+                              rolled - (foot.free[frame + 1] - foot.free[frame]);
+            x.AddStep(frame, stepWeight, static_cast<double>(step.x));
+            z.AddStep(frame, stepWeight, static_cast<double>(step.z));
+            if (i + 2 < drift.size())
+            {
+                x.AddBend(frame, shakeWeight);
+                z.AddBend(frame, shakeWeight);
+            }
         }
     }
-    return holds;
+    const std::vector<double> offX = x.Solve();
+    const std::vector<double> offZ = z.Solve();
+    std::vector<Vec3> path(foot.free.begin(), foot.free.end());
+    for (size_t frame = 0; frame < path.size(); ++frame)
+        path[frame] =
+            path[frame] + Vec3{static_cast<float>(offX[frame]), 0.0f, static_cast<float>(offZ[frame])};
+    return path;
 }
 
 } // namespace gw

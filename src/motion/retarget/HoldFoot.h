@@ -8,26 +8,19 @@
 
 namespace gw {
 
-/// How a foot is held over the ground in one frame.
-struct FootHold
-{
-    float share =
-        0.0f; ///< 0 where the foot goes with its leg, 1 where it stands; between at a contact's ends
-    Vec3 place = kVec3Zero; ///< where it stands; x and z count
-};
-
-/// The ways of a foot, place by place of every frame.
+/// The ways of a foot, place by place of every frame, all in the target's lengths.
 struct FootPaths
 {
-    std::span<const Vec3> path;   ///< as it would go if nothing held it
-    std::span<const Vec3> source; ///< as the source's goes
-    double scale;                 ///< of the source's lengths
+    std::span<const Vec3> free;        ///< the target's ankle, as it would go if nothing held it
+    std::span<const Vec3> toe;         ///< from the target's ankle to its toe
+    std::span<const Vec3> sourceAnkle; ///< of the source
+    std::span<const Vec3> sourceToe;   ///< of the source
+    double leg;                        ///< length
 };
 
-/// Holds a foot in the frames of the contacts: in one place, near to its own path in the contact's middle.
-/// Where the source's foot drifts farther off than `play` in a contact, the place goes with it. Holds fade at
-/// the ends of a contact over `fadeFrames`, the smaller part of which lies outside.
-std::vector<FootHold> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double play,
-                               double fadeFrames);
+/// Where the ankle goes over the ground so that the foot stands still in the frames of the contacts, and
+/// rolls over its toe where the source's does: x and z of every frame. y is that of the free path. Outside of
+/// contacts the ankle goes back to its free path.
+std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame);
 
 } // namespace gw

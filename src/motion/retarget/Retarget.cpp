@@ -180,7 +180,7 @@ bool CRetargeter::Retarget(float begin, float last, float phase, float frequency
         node->DetachControls();
 
     CPoseMatcher matcher(*this, target);
-    CFaithfulPose keeper(*this, matcher, m_bFaithful ? &target : nullptr);
+    CFaithfulPose keeper(*this, matcher, m_bFaithful ? &target : nullptr, m_bHoldHands);
     matcher.MatchPose();
     matcher.WriteNodes();
     GroundTarget(target, 0.0f);
@@ -231,14 +231,18 @@ void CRetargeter::PoseFrames(CPoseMatcher& matcher, const std::vector<CKeyframeC
     MatchFrames(matcher, tracks, run, keeper);
     if (!keeper)
         return;
+    const double secondsPerFrame = IsFrameTime(run.frequency) ? run.frequency : kUsualFrameSeconds;
     const size_t frameCount = tracks.front()->m_kKeyTimes.size();
-    keeper->Plan(tracks, run.rootPosition + (run.resetOrigin ? kVec3Zero : targetBase),
-                 IsFrameTime(run.frequency) ? run.frequency : kUsualFrameSeconds, run.useLegs);
+    keeper->Plan(tracks, run.rootPosition + (run.resetOrigin ? kVec3Zero : targetBase), secondsPerFrame,
+                 run.useLegs);
     for (size_t frame = 0; frame < frameCount; ++frame)
     {
         keeper->WriteFrame(frame, tracks);
         ShowProgress(frameCount + frame, 2 * frameCount);
     }
+    keeper->PlanHands(tracks, secondsPerFrame);
+    for (size_t frame = 0; frame < frameCount; ++frame)
+        keeper->WriteHands(frame, tracks);
 }
 
 void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframeControl*>& tracks,
@@ -262,12 +266,12 @@ void CRetargeter::MatchFrames(CPoseMatcher& matcher, const std::vector<CKeyframe
     {
         sampler.Sample(static_cast<float>(frame) / run.frequency);
         matcher.MatchPose();
+        if (keeper)
+            keeper->Append();
         bones.front().translation = run.rootPosition + path.Advance(frame == 0 && run.resetOrigin);
         WriteKeys(bones, tracks, frame);
         if (run.useLegs)
             legs.Plant(frame, scale, tracks);
-        if (keeper)
-            keeper->Append();
         ShowProgress(frame, keeper ? 2 * frameCount : frameCount);
     }
 }

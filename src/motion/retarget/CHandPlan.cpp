@@ -1,0 +1,165 @@
+// A hand that rests on a thigh, claps or props itself on the floor is seen to do so by the gap between the
+// two. On a target with longer arms the same directions lead past it or into it. So the gap is kept, and
+// nothing else: the hand may lie farther up or down the thigh.
+//
+// Thighs and trunk are segments. In the source, n is the way from the nearest point of the segment to the
+// hand. In the target, the hand is wanted at the point of its segment that is nearest to the free hand, plus
+// n, made perpendicular to the segment at its length. Head and other hand are points, and the floor is a
+// height. Near things count more than far ones, and things out of touch not at all. Between touches least
+// squares over all frames lead the hand back onto its free path, as they do with feet (CBandFit).
+
+#include "CHandPlan.h"
+
+#include "Directions.h"
+#include "Figures.h"
+
+#include <algorithm>
+#include <cmath>
+
+namespace gw {
+
+namespace {
+
+// Millimetres of the target.
+constexpr double kTouch = 30.0; // a gap that is kept in full
+constexpr double kNear = 50.0;  // a gap that counts half as much as none
+constexpr double kFade = 30.0;  // beyond that, until it is not kept at all
+constexpr double kThigh = 50.0; // from the middle of things to where a wrist lies on them
+constexpr double kTrunk = 60.0;
+constexpr double kHead = 80.0;
+constexpr double kHand = 50.0;
+constexpr double kFloor = 40.0;
+constexpr double kOnFloor = 20.0; // a wrist is never wanted lower
+
+constexpr double kTouchWeight = 60.0; // of a hand that touches, against 1 for its free path
+
+// Of the source's side of a thing, against that on which the hand is anyhow.
+constexpr float kSourceSide = 0.5f;
+
+struct Segment
+{
+    Vec3 from;
+    Vec3 to;
+
+    Vec3 Nearest(const Vec3& point) const
+    {
+        const Vec3 way = to - from;
+        const double square = Vec3Dot(way, way);
+        const double share = square > 0.0 ? Vec3Dot(point - from, way) / square : 0.0;
+        return from + way * static_cast<float>(std::clamp(share, 0.0, 1.0));
+    }
+    bool IsInside(const Vec3& nearest) const { return nearest != from && nearest != to; }
+};
+
+Vec3 HipMiddle(const TouchPoints& body)
+{
+    return (body.hips[0] + body.hips[1]) * 0.5f;
+}
+
+// How much a gap is to be kept: near ones more than the many that are just in touch.
+double WeightOf(double distance, double thickness)
+{
+    const double gap = distance - thickness;
+    const double near = kNear / (kNear + std::max(gap, 0.0));
+    return (1.0 - Smoothstep((gap - kTouch) / kFade)) * near * near;
+}
+
+// Where a hand is wanted by a segment: as far from it as the source's, on the side that lies between its own
+// and the source's.
+Vec3 WantedAt(const Segment& source, const Segment& target, const Vec3& sourceHand, const Vec3& hand)
+{
+    const Vec3 way = sourceHand - source.Nearest(sourceHand);
+    const Vec3 nearest = target.Nearest(hand);
+    Vec3 side = hand - nearest + way * kSourceSide;
+    if (target.IsInside(nearest))
+        side = Across(side, Vec3Normalized(target.to - target.from));
+    return nearest + Vec3Normalized(side) * static_cast<float>(Vec3Length(way));
+}
+
+struct Thing
+{
+    Segment source;
+    Segment target;
+    double thickness;
+};
+
+std::array<Thing, 4> ThingsOf(const TouchPoints& source, const TouchPoints& target)
+{
+    return {
+        {{{source.hips[0], source.knees[0]}, {target.hips[0], target.knees[0]}, kThigh},
+         {{source.hips[1], source.knees[1]}, {target.hips[1], target.knees[1]}, kThigh},
+         {{HipMiddle(source), source.neck}, {HipMiddle(target), target.neck}, kTrunk},
+         {{source.head, source.head}, {target.head, target.head}, kHead}}
+    };
+}
+
+double Distance(const Segment& segment, const Vec3& point)
+{
+    return Vec3Length(point - segment.Nearest(point));
+}
+
+} // namespace
+
+CHandPlan::CHandPlan(size_t frameCount, double secondsPerFrame, bool hasFloor) : m_bHasFloor(hasFloor)
+{
+    const CBandFit free(frameCount, BendWeight(kReturnHertz, secondsPerFrame), 1.0);
+    m_kFits.assign(2, {free, free, free});
+}
+
+bool CHandPlan::Touches(const TouchPoints& source) const
+{
+    const auto isNear = [](double distance, double thickness) { return WeightOf(distance, thickness) > 0.0; };
+    if (isNear(Vec3Length(source.hands[0] - source.hands[1]), kHand))
+        return true;
+    return std::ranges::any_of(source.hands, [&](const Vec3& hand) {
+        const auto things = ThingsOf(source, source);
+        return (m_bHasFloor && isNear(static_cast<double>(hand.y), kFloor)) ||
+               std::ranges::any_of(things, [&](const Thing& thing) {
+                   return isNear(Distance(thing.source, hand), thing.thickness);
+               });
+    });
+}
+
+void CHandPlan::Pull(size_t side, size_t frame, double weight, const Vec3& way)
+{
+    m_kFits[side].x.AddValue(frame, kTouchWeight * weight, static_cast<double>(way.x));
+    m_kFits[side].y.AddValue(frame, kTouchWeight * weight, static_cast<double>(way.y));
+    m_kFits[side].z.AddValue(frame, kTouchWeight * weight, static_cast<double>(way.z));
+}
+
+void CHandPlan::Add(size_t frame, const TouchPoints& source, const TouchPoints& target)
+{
+    const Vec3 between = source.hands[0] - source.hands[1];
+    const Vec3 apart = (target.hands[0] - target.hands[1] - between) * 0.5f;
+    const double clasp = WeightOf(Vec3Length(between), kHand);
+    for (size_t side = 0; side < 2; ++side)
+    {
+        const Vec3& hand = target.hands[side];
+        const Vec3& sourceHand = source.hands[side];
+        for (const Thing& thing : ThingsOf(source, target))
+            Pull(side, frame, WeightOf(Distance(thing.source, sourceHand), thing.thickness),
+                 WantedAt(thing.source, thing.target, sourceHand, hand) - hand);
+        Pull(side, frame, clasp, side == 0 ? -apart : apart);
+        if (!m_bHasFloor)
+            continue;
+        const auto height = static_cast<double>(sourceHand.y);
+        m_kFits[side].y.AddValue(frame, kTouchWeight * WeightOf(height, kFloor),
+                                 std::max(height, kOnFloor) - static_cast<double>(hand.y));
+    }
+}
+
+void CHandPlan::Solve()
+{
+    for (size_t side = 0; side < 2; ++side)
+    {
+        const std::vector<double> x = m_kFits[side].x.Solve();
+        const std::vector<double> y = m_kFits[side].y.Solve();
+        const std::vector<double> z = m_kFits[side].z.Solve();
+        for (size_t frame = 0; frame < x.size(); ++frame)
+            m_kWays[side].push_back(
+                {static_cast<float>(x[frame]), static_cast<float>(y[frame]), static_cast<float>(z[frame])});
+    }
+    m_kFits.clear();
+}
+
+} // namespace gw

@@ -1,0 +1,207 @@
+// A trunk that leans as the source's whatever its proportions, and hands that keep their gaps.
+
+#include "Angles.h"
+#include "CFaithfulArm.h"
+#include "CHandPlan.h"
+#include "CKeyframeControl.h"
+#include "CTrunkAim.h"
+#include "Directions.h"
+#include "HostBones.h"
+#include "Skeleton.h"
+
+#include <cmath>
+#include <gtest/gtest.h>
+
+namespace gw {
+namespace {
+
+CNode* AddJoint(CNode* parent, const std::string& name, const Vec3& offset, const Mat3& turn = kMat3Identity)
+{
+    auto* const node = new CNode;
+    node->SetName(name.c_str());
+    node->m_kMatrix = Mat4Compose(turn, offset);
+    if (parent)
+        parent->AttachChild(node);
+    return node;
+}
+
+// The target's make, but for legs below the knees.
+Ref<CNode> MakeTarget()
+{
+    const Mat3 down = Mat3FromAxisAngle(kVec3UnitZ, kPi);
+    Ref<CNode> root = AddJoint(nullptr, "LowerTorso", {0.0f, 923.0f, 0.0f});
+    CNode* const chest =
+        AddJoint(AddJoint(root.Get(), "Waist", {0.0f, 95.0f, 0.0f}), "UpperTorso", {0.0f, 150.0f, 0.0f});
+    AddJoint(AddJoint(chest, "Neck", {0.0f, 265.0f, 0.0f}), "Head", {0.0f, 95.0f, 0.0f});
+    for (const float side : {1.0f, -1.0f})
+    {
+        const std::string name = side > 0.0f ? "L" : "R";
+        AddJoint(AddJoint(root.Get(), name + "Pelvis", kVec3Zero, down), name + "Thigh",
+                 {-95.0f * side, 138.0f, 0.0f});
+        CNode* const collar = AddJoint(chest, name + "Collar", {25.0f * side, 215.0f, 0.0f},
+                                       Mat3FromAxisAngle(kVec3UnitZ, -0.5f * kPi * side));
+        CNode* const arm = AddJoint(collar, name + "UpperArm", {0.0f, 145.0f, 0.0f});
+        AddJoint(AddJoint(arm, name + "Forearm", {0.0f, 285.0f, 0.0f}), name + "Hand", {0.0f, 255.0f, 0.0f});
+    }
+    root->UpdateScene(0.0f, true);
+    return root;
+}
+
+// A source with hip joints ahead of its spine, a short small of the back and a long chest.
+Ref<CNode> MakeSource()
+{
+    Ref<CNode> root = AddJoint(nullptr, "Hips", {0.0f, 90.0f, 0.0f});
+    AddJoint(root.Get(), "LHip", {9.0f, -6.0f, 3.0f});
+    AddJoint(root.Get(), "RHip", {-9.0f, -6.0f, 3.0f});
+    CNode* const chest =
+        AddJoint(AddJoint(root.Get(), "Spine", {0.0f, 8.0f, -1.0f}), "Chest", {0.0f, 8.0f, 0.0f});
+    AddJoint(AddJoint(chest, "Throat", {0.0f, 34.0f, 0.0f}), "Skull", {0.0f, 9.0f, 0.0f});
+    root->UpdateScene(0.0f, true);
+    return root;
+}
+
+Vec3 Place(CNode& root, const char* name)
+{
+    return FindNode(&root, name)->m_kWorldMatrix.Translation();
+}
+
+Vec3 Chord(CNode& root, const char* left, const char* right, const char* neck)
+{
+    return Place(root, neck) - (Place(root, left) + Place(root, right)) * 0.5f;
+}
+
+TEST(CTrunkAim, WayFromHipsToNeckPointsAsTheSourcesAndTheHeadKeepsItsTurn)
+{
+    const Ref<CNode> source = MakeSource();
+    const Ref<CNode> target = MakeTarget();
+    CRetargeter table;
+    table.SetScenes(source.Get(), target.Get());
+    for (const auto& [bone, joint] : {
+             std::pair{"LowerTorso", "Hips"  },
+             {"Waist",      "Spine" },
+             {"UpperTorso", "Chest" },
+             {"Neck",       "Throat"},
+             {"Head",       "Skull" },
+             {"LThigh",     "LHip"  },
+             {"RThigh",     "RHip"  }
+    })
+        table.SetSourceOf(FindNode(target.Get(), bone), FindNode(source.Get(), joint));
+    CPoseMatcher matcher(table, *target);
+    CTrunkAim aim(table, matcher, target.Get());
+    for (const char* joint : {"Hips", "Spine", "Chest", "Throat"}) // a bow, and a turn to the side
+    {
+        CNode& node = *FindNode(source.Get(), joint);
+        node.m_kMatrix = Mat4Compose(TurnAbout(kVec3UnitX, 35.0) * TurnAbout(kVec3UnitY, 10.0),
+                                     node.m_kMatrix.Translation());
+    }
+    source->UpdateScene(0.0f, true);
+    matcher.MatchPose();
+    const auto head = static_cast<size_t>(matcher.IndexOf(FindNode(target.Get(), "Head")));
+    const Mat3 turn = NormalizedRows(matcher.Bones()[head].world);
+    aim.Aim(matcher);
+    matcher.WriteNodes();
+    target->UpdateScene(0.0f, true);
+    EXPECT_LT(
+        AngleBetween(Chord(*target, "LThigh", "RThigh", "Neck"), Chord(*source, "LHip", "RHip", "Throat")),
+        0.01);
+    EXPECT_LT(AngleOf(Mat3Transpose(turn) * NormalizedRows(FindNode(target.Get(), "Head")->m_kWorldMatrix)),
+              0.05);
+}
+
+// A body that sits with its thighs along z; its hands are far from everything.
+TouchPoints Sitting(float scale)
+{
+    TouchPoints body;
+    for (size_t side = 0; side < 2; ++side)
+    {
+        const float x = side == 0 ? 1.0f : -1.0f;
+        body.hips[side] = {95.0f * x, 450.0f, 0.0f};
+        body.knees[side] = {95.0f * x, 450.0f, 360.0f};
+        body.hands[side] = Vec3{400.0f * x, 700.0f, 200.0f} * scale;
+    }
+    body.neck = {0.0f, 1090.0f, 0.0f};
+    body.head = {0.0f, 1290.0f, 0.0f};
+    return body;
+}
+
+TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
+{
+    const Vec3 free{95.0f, 420.0f, 480.0f}; // past the knee and below it
+    const struct
+    {
+        const char* what;
+        Vec3 source;
+        Vec3 other;  // hand of the source
+        double left; // its gap to what it touches
+    } rows[] = {
+        {"on a thigh",      {95.0f, 510.0f, 250.0f},  {-400.0f, 700.0f, 200.0f}, 60.0},
+        {"on the floor",    {400.0f, 40.0f, 250.0f},  {-400.0f, 700.0f, 200.0f}, 40.0},
+        {"that clap",       {30.0f, 900.0f, 400.0f},  {-30.0f, 900.0f, 400.0f},  60.0},
+        {"at the head",     {0.0f, 1290.0f, 90.0f},   {-400.0f, 700.0f, 200.0f}, 90.0},
+        {"far from it all", {400.0f, 700.0f, 400.0f}, {-400.0f, 700.0f, 200.0f}, -1.0},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        TouchPoints source = Sitting(1.0f);
+        TouchPoints target = source;
+        source.hands = {row.source, row.other};
+        target.hands[0] = free;
+        CHandPlan plan(40, 1.0 / 30.0, true);
+        for (size_t frame = 0; frame < 40; ++frame)
+            plan.Add(frame, source, target);
+        plan.Solve();
+        EXPECT_EQ(plan.Touches(source), row.left >= 0.0);
+        const Vec3 hand = free + plan.Way(0, 20);
+        const Vec3 other = target.hands[1] + plan.Way(1, 20);
+        const Vec3 along = hand - Vec3{95.0f, 450.0f, std::min(hand.z, 360.0f)};
+        const double gaps[] = {Vec3Length(along), static_cast<double>(hand.y), Vec3Length(hand - other),
+                               Vec3Length(hand - target.head)};
+        if (row.left >= 0.0)
+            EXPECT_NEAR(gaps[&row - rows], row.left, 25.0) << "of 120 and more";
+        else
+            EXPECT_EQ(Vec3Length(plan.Way(0, 20)), 0.0);
+    }
+}
+
+TEST(CFaithfulArm, HandGoesItsWayAndTheElbowStaysOnItsSide)
+{
+    const Ref<CNode> source = MakeTarget();
+    const Ref<CNode> target = MakeTarget();
+    CRetargeter table;
+    table.SetScenes(source.Get(), target.Get());
+    for (const char* bone : {"LUpperArm", "LForearm", "LHand"})
+        table.SetSourceOf(FindNode(target.Get(), bone), FindNode(source.Get(), bone));
+    CPoseMatcher matcher(table, *target);
+    auto arm = CFaithfulArm::Plan(table, matcher, *target, kLeftBones);
+    ASSERT_TRUE(arm);
+    CNode& forearm = *FindNode(target.Get(), "LForearm");
+    const auto bent = static_cast<size_t>(matcher.IndexOf(&forearm));
+    matcher.Bones()[bent].rotation = TurnAbout(kVec3UnitX, 60.0);
+    for (size_t bone = 0; bone < matcher.Bones().size(); ++bone)
+        matcher.UpdateWorld(bone);
+    const Vec3 hand = matcher.Bones()[arm->Hand()].world.Translation();
+    const Vec3 elbow = matcher.Bones()[bent].world.Translation();
+    std::vector<Ref<CKeyframeControl>> kept;
+    std::vector<CKeyframeControl*> tracks;
+    for (const CPoseMatcher::Bone& bone : matcher.Bones())
+    {
+        kept.emplace_back(new CKeyframeControl);
+        kept.back()->m_kRotationKeys.assign(1, QuatFromMat3(bone.rotation));
+        tracks.push_back(kept.back().Get());
+    }
+    arm->ReadPose(matcher);
+    const Vec3 way{-40.0f, -30.0f, 20.0f};
+    arm->MoveHand(matcher, way, 0, tracks);
+    for (size_t bone = 0; bone < matcher.Bones().size(); ++bone)
+    {
+        matcher.Bones()[bone].rotation = QuatToMat3(tracks[bone]->m_kRotationKeys[0]);
+        matcher.UpdateWorld(bone);
+    }
+    EXPECT_LT(Vec3Length(matcher.Bones()[arm->Hand()].world.Translation() - hand - way), 2.0);
+    EXPECT_LT(Vec3Length(matcher.Bones()[bent].world.Translation() - elbow), 60.0)
+        << "not the other way round";
+}
+
+} // namespace
+} // namespace gw
