@@ -27,14 +27,14 @@ CBoneNames::CBoneNames(CNode* root)
             continue;
         const std::string_view name = object->NameView();
         CNode* node = static_cast<CNode*>(object);
-        if (m_kExact.try_emplace(std::string(name), node).second)
+        if (m_kExact.try_emplace(name, node).second)
             m_kNames.emplace_back(name);
     }
 }
 
 CNode* CBoneNames::Find(std::string_view name) const
 {
-    const auto exact = m_kExact.find(std::string(name));
+    const auto exact = m_kExact.find(name);
     if (exact != m_kExact.end())
         return exact->second;
     const auto lower = LowerCaseNames().find(LowerCase(name));
@@ -42,7 +42,7 @@ CNode* CBoneNames::Find(std::string_view name) const
 }
 
 // Most look-ups match exactly, so this table is built only when one does not.
-const CBoneNames::NodeOfName& CBoneNames::LowerCaseNames() const
+const std::unordered_map<std::string, CNode*>& CBoneNames::LowerCaseNames() const
 {
     if (m_kLowerCase.empty())
     {

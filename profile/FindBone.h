@@ -24,12 +24,10 @@ public:
     const std::vector<std::string>& Names() const { return m_kNames; }
 
 private:
-    using NodeOfName = std::unordered_map<std::string, CNode*>;
+    const std::unordered_map<std::string, CNode*>& LowerCaseNames() const;
 
-    const NodeOfName& LowerCaseNames() const;
-
-    NodeOfName m_kExact;
-    mutable NodeOfName m_kLowerCase; ///< built when first needed
+    std::unordered_map<std::string_view, CNode*> m_kExact;        ///< views of the nodes' own names
+    mutable std::unordered_map<std::string, CNode*> m_kLowerCase; ///< built when first needed
     std::vector<std::string> m_kNames;
 };
 

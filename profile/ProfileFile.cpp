@@ -132,7 +132,7 @@ bool CProfileReader::NextPiece(std::string_view& piece)
 
 void CProfileReader::TakeTokens(std::string_view piece)
 {
-    for (std::string& token : m_kToken)
+    for (std::string_view& token : m_kToken)
     {
         const std::string_view word = NextWord(piece);
         if (word.empty())

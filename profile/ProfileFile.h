@@ -84,7 +84,7 @@ private:
     std::string_view m_kRest;
     std::string_view m_kRestOfLine;
     std::string m_kName;
-    std::array<std::string, kTokenCount> m_kToken; // not cleared between lines
+    std::array<std::string_view, kTokenCount> m_kToken; // not cleared between lines
     size_t m_uiLine = 0;
 };
 

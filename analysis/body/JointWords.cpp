@@ -8,6 +8,7 @@
 #include "Numbers.h"
 #include "Text.h"
 
+#include <algorithm>
 #include <array>
 #include <optional>
 #include <string>
@@ -120,6 +121,19 @@ constexpr Word kLexicon[] = {
     {"bale",     kToe        }, // the ball, misspelled in a widespread rig
 };
 
+// Sorted, because looking up words is the inner loop of every search by names.
+constexpr auto kSortedLexicon = [] {
+    auto words = std::to_array(kLexicon);
+    std::ranges::sort(words, {}, &Word::text);
+    return words;
+}();
+
+auto WordsFrom(char letter)
+{
+    return std::ranges::equal_range(kSortedLexicon, letter, {},
+                                    [](const Word& word) { return word.text.front(); });
+}
+
 constexpr uint32_t kSides = kLeft | kRight;
 constexpr uint32_t kLevels = kUp | kLow | kMid;
 
@@ -182,10 +196,9 @@ std::optional<uint32_t> Features(std::string_view token)
     {
         if (!parts[begin])
             continue;
-        for (const Word& word : kLexicon)
+        for (const Word& word : WordsFrom(token[begin]))
         {
-            // Most words differ in the first letter, and this is the inner loop of every search by names.
-            if (word.text.front() != token[begin] || !token.substr(begin).starts_with(word.text))
+            if (!token.substr(begin).starts_with(word.text))
                 continue;
             std::optional<Part>& part = parts[begin + word.text.size()];
             const Part longer{parts[begin]->words + 1, parts[begin]->features | word.features};
@@ -197,14 +210,12 @@ std::optional<uint32_t> Features(std::string_view token)
     return whole ? std::optional(whole->features) : std::nullopt;
 }
 
-uint32_t SideLetter(char letter)
+// The same with a side that a letter stands for. Nothing for any other letter.
+std::optional<uint32_t> SideFeatures(char letter, std::string_view token)
 {
-    return letter == 'l' ? kLeft : letter == 'r' ? kRight : kNothing;
-}
-
-std::optional<uint32_t> With(std::optional<uint32_t> features, uint32_t more)
-{
-    return features && more ? std::optional(*features | more) : std::nullopt;
+    const uint32_t side = letter == 'l' ? kLeft : letter == 'r' ? kRight : kNothing;
+    const std::optional<uint32_t> features = side ? Features(token) : std::nullopt;
+    return features ? std::optional(*features | side) : std::nullopt;
 }
 
 // Same for a token that can include a letter for the side, or consist of it.
@@ -214,9 +225,9 @@ std::optional<uint32_t> TokenFeatures(std::string_view token)
         return kNothing; // the letter for the middle, besides L and R
     if (const auto whole = Features(token))
         return whole;
-    if (const auto front = With(Features(token.substr(1)), SideLetter(token.front())))
+    if (const auto front = SideFeatures(token.front(), token.substr(1)))
         return front;
-    return With(Features(token.substr(0, token.size() - 1)), SideLetter(token.back()));
+    return SideFeatures(token.back(), token.substr(0, token.size() - 1));
 }
 
 bool IsDigit(char c)

@@ -43,7 +43,7 @@ public:
 
 private:
     // Analysis that needs several poses is delayed until a profile fits.
-    const SourceBody& Body()
+    SourceBody& Body()
     {
         if (!body_)
             body_.emplace(source_);

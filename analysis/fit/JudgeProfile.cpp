@@ -110,12 +110,22 @@ ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
 
 SourceBody::SourceBody(CNode& root) : byNames(FindBodyByNames(root)), tree(root) {}
 
-ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, const SourceBody& source)
+const std::vector<BodyDoubt>& SourceBody::Check(const CBodyMap& body)
+{
+    if (body != checked)
+    {
+        doubts = CheckBody(body, tree);
+        checked = body;
+    }
+    return doubts;
+}
+
+ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, SourceBody& source)
 {
     CBodyMap body = BodyOfTable(table, targets);
     AddUntold(source.byNames, body);
     ProfileVerdict verdict;
-    for (const BodyDoubt& doubt : CheckBody(body, source.tree))
+    for (const BodyDoubt& doubt : source.Check(body))
         verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
     CheckSpine(body, table.SourceOf(targets.Find(kTorsoBone)), verdict);

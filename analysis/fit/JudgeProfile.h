@@ -59,11 +59,16 @@ struct SourceBody
 {
     explicit SourceBody(CNode& root);
 
+    /// What CheckBody returns. Most maps of one rig differ only in their rotations, so the last answer is kept.
+    const std::vector<BodyDoubt>& Check(const CBodyMap& body);
+
     CBodyMap byNames; ///< found by joint names
     CJointTree tree;  ///< positions and lengths
+    CBodyMap checked;
+    std::vector<BodyDoubt> doubts; ///< of the body that was checked last
 };
 
 /// Judges the rows of a retargeter's table.
-ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, const SourceBody& source);
+ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets, SourceBody& source);
 
 } // namespace gw

@@ -133,24 +133,21 @@ std::string FolderOf(const std::string& path)
 }
 
 // Not with the standard library's iterator: it ends the program if there is not enough memory for a path.
-std::vector<std::string> NamesInFolder(const std::string& folder)
+std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension)
 {
+    // Most file systems list the type of each entry. Only links and unknown entries need a look.
+    const auto isRegular = [&](const dirent& entry) {
+        return entry.d_type == DT_REG || IsRegular(WithSeparator(folder) + entry.d_name);
+    };
     std::vector<std::string> names;
     const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(folder.c_str()), closedir);
     if (!directory && errno == ENOMEM)
         throw std::bad_alloc();
     while (const dirent* entry = directory ? readdir(directory.get()) : nullptr)
-        names.emplace_back(entry->d_name);
-    return names;
-}
-
-std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension)
-{
-    std::vector<std::string> names = NamesInFolder(folder);
-    std::erase_if(names, [&](const std::string& name) {
-        return !HasExtension(name, extension) || IsPrivateName(name) ||
-               !IsRegular(WithSeparator(folder) + name);
-    });
+    {
+        if (HasExtension(entry->d_name, extension) && !IsPrivateName(entry->d_name) && isRegular(*entry))
+            names.emplace_back(entry->d_name);
+    }
     std::ranges::sort(names);
     return names;
 }

@@ -46,10 +46,8 @@ bool DeleteFile(const std::string& path);
 /// Returns the folder of a path with its separator, or empty if the path has none. Unlike SplitPath, accepts
 /// only the platform's separator, as the system does.
 std::string FolderOf(const std::string& path);
-/// Returns the names of all entries of a folder, unsorted; empty if it cannot be read.
-std::vector<std::string> NamesInFolder(const std::string& folder);
 /// Returns the names of a folder's regular files with this extension (dot included, case ignored), sorted by
-/// name so that runs are the same everywhere. Private files are skipped.
+/// name so that runs are the same everywhere; empty if the folder cannot be read. Private files are skipped.
 std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
 
 /// Resolves a relative path, with its "..", against a folder that contains no links.

@@ -186,7 +186,8 @@ bool IsFirstSweep(const std::string& folder)
 
 std::string PrivateName(const std::string& folder, std::string_view extension)
 {
-    std::random_device random;
+    std::random_device random(
+        "getentropy"); // the default asks the processor, which is slow in virtual machines
     char parts[3 * kPartBytes + 1];
     std::snprintf(parts, sizeof parts, "%08x-%08x-%08x", MachineNumber(), static_cast<uint32_t>(getpid()),
                   random());

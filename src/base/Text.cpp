@@ -28,7 +28,7 @@ char Upper(char c)
 class CByteSet
 {
 public:
-    explicit CByteSet(std::string_view members)
+    explicit constexpr CByteSet(std::string_view members)
     {
         for (const char c : members)
             m_uiBits[Word(c)] |= Bit(c);
@@ -36,8 +36,8 @@ public:
     bool Has(char c) const { return (m_uiBits[Word(c)] & Bit(c)) != 0; }
 
 private:
-    static size_t Word(char c) { return static_cast<unsigned char>(c) >> 6; }
-    static uint64_t Bit(char c) { return uint64_t{1} << (static_cast<unsigned char>(c) & 63); }
+    static constexpr size_t Word(char c) { return static_cast<unsigned char>(c) >> 6; }
+    static constexpr uint64_t Bit(char c) { return uint64_t{1} << (static_cast<unsigned char>(c) & 63); }
 
     uint64_t m_uiBits[4] = {};
 };
@@ -109,6 +109,16 @@ size_t EditDistance(std::string_view a, std::string_view b)
     return row.back();
 }
 
+std::string_view NextToken(std::string_view& rest, const CByteSet& set)
+{
+    const auto separates = [&set](char c) { return set.Has(c); };
+    const auto begin = std::ranges::find_if_not(rest, separates);
+    const auto end = std::find_if(begin, rest.end(), separates);
+    const std::string_view token(begin, end);
+    rest = {end, rest.end()};
+    return token;
+}
+
 } // namespace
 
 bool EqualNoCase(std::string_view a, std::string_view b)
@@ -137,18 +147,13 @@ std::string_view CutTrailing(std::string_view text)
 
 std::string_view NextToken(std::string_view& rest, std::string_view delimiters)
 {
-    const CByteSet set(delimiters);
-    const auto separates = [&set](char c) { return set.Has(c); };
-    const auto begin = std::ranges::find_if_not(rest, separates);
-    const auto end = std::find_if(begin, rest.end(), separates);
-    const std::string_view token(begin, end);
-    rest = {end, rest.end()};
-    return token;
+    return NextToken(rest, CByteSet(delimiters));
 }
 
 std::string_view NextWord(std::string_view& rest)
 {
-    return NextToken(rest, kBlanks);
+    constexpr CByteSet kSet(kBlanks);
+    return NextToken(rest, kSet);
 }
 
 bool NextLine(std::string_view& rest, std::string_view& line)

@@ -11,6 +11,7 @@
 #include "MakeBlock.h"
 
 #include <algorithm>
+#include <limits>
 #include <numeric>
 #include <utility>
 
@@ -37,18 +38,16 @@ bool ComesBefore(const IndexLists& lists, uint32_t a, uint32_t b)
 // Same for a single list of values below the number of corners, which is the case for every bone.
 std::vector<uint32_t> NumberValues(std::span<const uint32_t> list, std::span<uint32_t> vertices)
 {
+    constexpr uint32_t kUnused = std::numeric_limits<uint32_t>::max();
     std::vector<uint32_t> cornerOf;
-    std::vector<uint32_t> numberOf(vertices.size());
-    std::vector<bool> isUsed(vertices.size());
+    cornerOf.reserve(vertices.size());
+    std::vector<uint32_t> numberOf(vertices.size(), kUnused);
     for (size_t corner = 0; corner < vertices.size(); ++corner)
-    {
-        isUsed[list[corner]] = true;
         numberOf[list[corner]] = static_cast<uint32_t>(corner);
-    }
-    for (size_t value = 0; value < vertices.size(); ++value)
+    for (uint32_t& number : numberOf)
     {
-        if (isUsed[value])
-            cornerOf.push_back(std::exchange(numberOf[value], static_cast<uint32_t>(cornerOf.size())));
+        if (number != kUnused)
+            cornerOf.push_back(std::exchange(number, static_cast<uint32_t>(cornerOf.size())));
     }
     std::ranges::transform(list.first(vertices.size()), vertices.begin(),
                            [&](uint32_t value) { return numberOf[value]; });

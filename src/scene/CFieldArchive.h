@@ -140,12 +140,16 @@ public:
     template <class T>
     void Link(const char* name, Ref<T>& slot)
     {
-        Slot(name, CLinkSlot::Counted(slot));
+        if (!m_pkHeld)
+            Slot(name, CLinkSlot::Counted(slot));
+        else if (slot)
+            m_pkHeld->push_back(slot.Get());
     }
     template <class T>
     void PlainLink(const char* name, Watch<T>& slot)
     {
-        Slot(name, CLinkSlot::Plain(slot));
+        if (!m_pkHeld)
+            Slot(name, CLinkSlot::Plain(slot));
     }
     /// A count followed by one link per element. Slot is Held<T> or Watch<T>.
     template <class Slots>
@@ -162,7 +166,7 @@ public:
         for (auto& slot : slots)
         {
             if constexpr (requires { slot.Set(nullptr); })
-                Slot(name, CLinkSlot::Plain(slot));
+                PlainLink(name, slot);
             else
                 Link(name, slot);
         }
@@ -229,6 +233,9 @@ protected:
     /// For archives that only look at links. They are not shown plain values, because skipping each one would
     /// cost a virtual call in every search of a tree.
     explicit CFieldArchive(CVersion version) : m_kVersion(version), m_bReading(false), m_bLinksOnly(true) {}
+    /// For searches of a tree, which only need the objects that each object keeps alive. They are appended to
+    /// `held` in file order, without a virtual call per link.
+    explicit CFieldArchive(std::vector<CObject*>& held) : CFieldArchive(kNewestVersion) { m_pkHeld = &held; }
 
     virtual void Values(const char* name, EFieldKind kind, void* values, size_t count) = 0;
     /// The same value repeated `count` times.
@@ -251,6 +258,7 @@ private:
     CVersion m_kVersion;
     bool m_bReading;
     bool m_bLinksOnly = false;
+    std::vector<CObject*>* m_pkHeld = nullptr;
 };
 
 /// Counts the bytes that fields take in a file.
@@ -323,19 +331,37 @@ void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
     EndArray();
 }
 
-/// Passes every link to a function, in file order, and skips everything else.
-template <class F>
-class CLinkVisitor : public CFieldArchive
+/// Skips everything but links.
+class CLinkArchive : public CFieldArchive
 {
 public:
-    explicit CLinkVisitor(F visit) : CFieldArchive(kNewestVersion), m_kVisit(visit) {}
-
     void Text(const char*, CText&) override {}
     bool Presence(const char*, bool present) override { return present; }
     size_t Count(const char*, size_t count, size_t) override { return count; }
 
 protected:
+    using CFieldArchive::CFieldArchive;
     void Values(const char*, EFieldKind, void*, size_t) override {}
+};
+
+/// Appends the objects that one keeps alive to a list, in file order.
+class CHeldCollector : public CLinkArchive
+{
+public:
+    explicit CHeldCollector(std::vector<CObject*>& held) : CLinkArchive(held) {}
+
+protected:
+    void Slot(const char*, const CLinkSlot&) override {}
+};
+
+/// Passes every link to a function, in file order.
+template <class F>
+class CLinkVisitor : public CLinkArchive
+{
+public:
+    explicit CLinkVisitor(F visit) : CLinkArchive(kNewestVersion), m_kVisit(visit) {}
+
+protected:
     void Slot(const char*, const CLinkSlot& slot) override { m_kVisit(slot); }
 
 private:

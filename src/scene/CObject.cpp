@@ -69,11 +69,8 @@ void ForEachModifier(CObject* head, F visit)
 // Appends the objects that an object keeps alive, in field order.
 void AppendHeld(CObject& object, std::vector<CObject*>& held)
 {
-    CLinkVisitor visitor([&held](const CLinkSlot& slot) {
-        if (CObject* const linked = slot.IsCounted() ? slot.Get() : nullptr)
-            held.push_back(linked);
-    });
-    object.Fields(visitor);
+    CHeldCollector collector(held);
+    object.Fields(collector);
 }
 
 // Returns the first match among an object and everything it keeps alive: each object before the ones it

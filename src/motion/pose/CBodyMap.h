@@ -24,6 +24,8 @@ struct BodyArm
     CNode* upperArm = nullptr;
     CNode* forearm = nullptr;
     CNode* hand = nullptr;
+
+    friend bool operator==(const BodyArm&, const BodyArm&) = default;
 };
 
 /// The joints of one leg; each rotates the bone below it. Null if the skeleton lacks it.
@@ -33,6 +35,8 @@ struct BodyLeg
     CNode* shin = nullptr;
     CNode* foot = nullptr; ///< the ankle
     CNode* toe = nullptr;  ///< the ball of the foot
+
+    friend bool operator==(const BodyLeg&, const BodyLeg&) = default;
 };
 
 /// The joints of a skeleton that belong to a human body. The nodes are not kept alive.
@@ -55,6 +59,8 @@ struct CBodyMap
     bool DrivesBody() const;
     /// Returns whether DrivesBody holds and both feet are present, without which no foot can be planted.
     bool HasFeet() const;
+
+    friend bool operator==(const CBodyMap&, const CBodyMap&) = default;
 };
 
 } // namespace gw
