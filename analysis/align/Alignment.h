@@ -1,7 +1,7 @@
 #pragma once
 
-#include "AlignReport.h"
 #include "CBodyMap.h"
+#include "Corrections.h"
 #include "Mat3.h"
 
 #include <cstddef>
@@ -50,7 +50,7 @@ struct Alignment
     /// Takes the space of the pelvis, upright where the body stands, to that of the aligned hip, whose bone
     /// is upright: the way to the spine leans from the pelvis.
     Mat3 pelvisTurn = kMat3Identity;
-    AlignReport report;
+    Corrections corrections;
 };
 
 /// Works out the alignment of a motion. False where its body has no hip, no two thighs or nothing above the

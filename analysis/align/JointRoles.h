@@ -30,6 +30,13 @@ enum class EBodyPart : uint8_t
     Toe,
 };
 
+/// Returns whether a part is one of the two long bones of an arm or leg.
+constexpr bool IsLimb(EBodyPart part)
+{
+    return part == EBodyPart::UpperArm || part == EBodyPart::Forearm || part == EBodyPart::Thigh ||
+           part == EBodyPart::Shin;
+}
+
 struct JointRole
 {
     EBodyPart part = EBodyPart::None;

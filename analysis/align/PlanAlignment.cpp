@@ -1,4 +1,3 @@
-#include "AlignNeeds.h"
 #include "Alignment.h"
 #include "BodyPose.h"
 #include "BodyStance.h"
@@ -9,6 +8,7 @@
 #include "Directions.h"
 #include "DoubledOffsets.h"
 #include "JointTurns.h"
+#include "RestCorrections.h"
 #include "Skeleton.h"
 #include "UpAxis.h"
 
@@ -26,19 +26,19 @@ bool HasBody(const BodyMotion& motion)
            motion.body.Leg(EBodySide::Left).thigh && motion.body.Leg(EBodySide::Right).thigh;
 }
 
-void ReportUp(const Vec3& up, AlignReport& report)
+void AddUp(const Vec3& up, Corrections& corrections)
 {
     if (up != kVec3UnitY)
-        report.findings.push_back(
-            {EAlignNeed::UpAxis, std::string(AxisName(up)), AngleBetween(up, kVec3UnitY)});
+        corrections.list.push_back(
+            {ECorrection::UpAxis, std::string(AxisName(up)), AngleBetween(up, kVec3UnitY)});
 }
 
-void ReportDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& doubled, AlignReport& report)
+void AddDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& doubled, Corrections& corrections)
 {
     for (size_t i = 0; i < joints.size(); ++i)
     {
         if (doubled[i])
-            report.findings.push_back({EAlignNeed::DoubledPositions, std::string(joints[i]->NameView())});
+            corrections.list.push_back({ECorrection::DoubledPositions, std::string(joints[i]->NameView())});
     }
 }
 
@@ -61,12 +61,6 @@ std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<Jo
             ways.push_back({from, to});
     }
     return ways;
-}
-
-bool IsLimb(EBodyPart part)
-{
-    return part == EBodyPart::UpperArm || part == EBodyPart::Forearm || part == EBodyPart::Thigh ||
-           part == EBodyPart::Shin;
 }
 
 // Whether the motion puts a joint elsewhere than its offset does, as seen from the joint above.
@@ -150,7 +144,7 @@ void CAlignmentPlanner::LookAtRest()
 {
     m_kTree.PoseRest();
     const double leg = LegLength(motion_.body);
-    alignment_.report.findings = FindRestNeeds(m_kTree, m_kRoles, leg);
+    alignment_.corrections.list = FindRestCorrections(m_kTree, m_kRoles, leg);
     m_kWays = FindLooseWays(m_kTree, m_kRoles, leg);
     if (motion_.limbs == ELimbWays::Mean)
         AddMovedLimbs(m_kTree, m_kRoles, m_kWays);
@@ -164,7 +158,7 @@ void CAlignmentPlanner::FindUp()
     const Vec3 worldUp = FindUpAxis(motion_.body, motion_.frequency, motion_.frameCount);
     m_kUp = m_bIsRest ? m_kUp : worldUp;
     alignment_.worldTurn = LeastSwing(worldUp, kVec3UnitY);
-    ReportUp(worldUp, alignment_.report);
+    AddUp(worldUp, alignment_.corrections);
 }
 
 void CAlignmentPlanner::PoseReference(const CMotionEvidence& evidence)
@@ -172,7 +166,7 @@ void CAlignmentPlanner::PoseReference(const CMotionEvidence& evidence)
     if (m_bIsRest)
         m_kTree.PoseRest();
     else
-        m_kTree.Pose(alignment_.report.referenceFrame = evidence.ReferenceFrame());
+        m_kTree.Pose(alignment_.corrections.referenceFrame = evidence.ReferenceFrame());
 }
 
 void CAlignmentPlanner::FillJoints(const std::vector<Mat3>& turns, const CReferencePose& pose)
@@ -195,7 +189,7 @@ bool CAlignmentPlanner::Plan()
     LookAtRest();
     FindUp();
     m_kDoubled = FindDoubled(m_kTree, motion_);
-    ReportDoubled(m_kTree.Joints(), m_kDoubled, alignment_.report);
+    AddDoubled(m_kTree.Joints(), m_kDoubled, alignment_.corrections);
     const CMotionEvidence evidence(motion_, alignment_.worldTurn, m_kWays);
     PoseReference(evidence);
     const CReferencePose pose(motion_.body, m_kUp);

@@ -74,7 +74,7 @@ public:
     std::vector<BodyDoubt> Check();
 
 private:
-    void Doubt(EBodyDoubt kind, BodyPlace place) { m_kDoubts.push_back({kind, place}); }
+    void Doubt(EDoubt kind, BodyPlace place) { m_kDoubts.push_back({kind, place}); }
     int Joint(BodyPlace place) const { return tree_.IndexOf(JointAt(body_, place)); }
     void CheckCarriers();
     void CheckSides();
@@ -113,7 +113,7 @@ void CBodyChecker::CheckCarriers()
         const CNode* const node = JointAt(body_, place);
         const CNode* const carrier = CarrierOf(body_, place);
         if (node && carrier && (node == carrier || !IsAtOrBelow(node, carrier)))
-            Doubt(EBodyDoubt::NotBelow, place);
+            Doubt(EDoubt::NotBelow, place);
     }
 }
 
@@ -131,18 +131,18 @@ void CBodyChecker::CheckLegsDown()
         for (size_t stance = 0; always && stance < stances.Count(); ++stance)
             always = goesUp(leg, stance);
         if (always)
-            Doubt(EBodyDoubt::LegsUp, {Thigh, side});
+            Doubt(EDoubt::LegsUp, {Thigh, side});
     }
 }
 
 void CBodyChecker::CheckSides()
 {
     if (JudgeSides(tree_, m_kLegs) < -kSidesSure)
-        Doubt(EBodyDoubt::SidesSwapped, {Thigh, EBodySide::Left});
+        Doubt(EDoubt::SidesSwapped, {Thigh, EBodySide::Left});
     const double arms =
         JudgeAlong(tree_, m_kLegs, Joint({UpperArm, EBodySide::Left}), Joint({UpperArm, EBodySide::Right}));
     if (arms < -kSidesSure)
-        Doubt(EBodyDoubt::SidesSwapped, {UpperArm, EBodySide::Left});
+        Doubt(EDoubt::SidesSwapped, {UpperArm, EBodySide::Left});
 }
 
 // The chain starts below the trunk, where the other side's limb branches off, and continues past the limb's
@@ -182,14 +182,13 @@ void CBodyChecker::CheckLimb(ELimb limb, EBodySide side)
     const LimbFit fit = JudgeLimb(tree_, chains, limb, mapped.joints);
     const LimbFit best = FitLimb(tree_, chains, limb);
     if (!fit.found)
-        return Doubt(EBodyDoubt::OddLength, place);
+        return Doubt(EDoubt::OddLength, place);
     if (!best.found || fit.cost < best.cost + kBetterChoice)
         return;
     if (limb == ELimb::Arm && best.joints.upper != mapped.joints.upper)
-        return Doubt(mapped.joints.upper < best.joints.upper ? EBodyDoubt::ArmIsClavicle
-                                                             : EBodyDoubt::ClavicleIsArm,
+        return Doubt(mapped.joints.upper < best.joints.upper ? EDoubt::ArmIsClavicle : EDoubt::ClavicleIsArm,
                      place);
-    Doubt(EBodyDoubt::OddLength, place);
+    Doubt(EDoubt::OddLength, place);
 }
 
 void CBodyChecker::CheckEvenness(BodyPlace place)
@@ -206,7 +205,7 @@ void CBodyChecker::CheckEvenness(BodyPlace place)
     const double left = boneOf(EBodySide::Left);
     const double right = boneOf(EBodySide::Right);
     if (left > 0.0 && right > 0.0 && std::max(left / right, right / left) > kUneven)
-        Doubt(EBodyDoubt::OddLength, place);
+        Doubt(EDoubt::OddLength, place);
 }
 
 CNode* RootOf(CNode* node)

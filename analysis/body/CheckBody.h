@@ -9,8 +9,8 @@ namespace gw {
 
 class CJointTree;
 
-/// A reason why a joint may not be what a body map says.
-enum class EBodyDoubt : uint8_t
+/// What speaks against a bone map. The first six are about where the joints of a body lie.
+enum class EDoubt : uint8_t
 {
     NotBelow,      ///< not below the joint that should carry it
     SidesSwapped,  ///< legs: left is not up x forward; arms: not on the same sides as the legs
@@ -18,11 +18,20 @@ enum class EBodyDoubt : uint8_t
     ArmIsClavicle, ///< the mapped upper arm is too short to be one: it is the clavicle
     LegsUp,        ///< the legs point along the trunk in every pose
     OddLength,     ///< a limb's bones are out of proportion, or differ in length from the other side's
+    OtherName,     ///< by its name, the joint is another part of the body
+    SpineCut,      ///< spine joints above the one that drives the upper torso are left out
+    Turned,        ///< the bone ends up turned sideways, by about a quarter turn or more
 };
+
+/// Whether a doubt is about which joint is which, rather than about how well the bones come out.
+constexpr bool IsOfRoles(EDoubt doubt)
+{
+    return doubt <= EDoubt::OtherName;
+}
 
 struct BodyDoubt
 {
-    EBodyDoubt kind = EBodyDoubt::NotBelow;
+    EDoubt kind = EDoubt::NotBelow;
     BodyPlace place; ///< the joint concerned; for a whole limb, its upper arm or thigh
 };
 

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "BVHOutline.h"
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CFindings.h"
 #include "CMappedFile.h"
 #include "CRowCheck.h"

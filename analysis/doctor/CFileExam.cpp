@@ -1,6 +1,6 @@
 #include "CFileExam.h"
 
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CMappedFile.h"
 #include "CMotionFile.h"
 #include "CheckPoses.h"
@@ -22,16 +22,16 @@ void CFileExam::ExamineBVH(const std::string& path)
 {
     m_spText = std::make_unique<CBVHExam>(m_kFindings);
     if (const EFailure failure = m_spText->Examine(path); failure != EFailure::None)
-        return m_kFindings.AddReader({failure, 0, {}}, ESeverity::Error);
+        return m_kFindings.Add({failure});
     if (!m_spText->IsWhole())
-        return m_kFindings.AddReader({EFailure::Changed, 0, {}}, ESeverity::Error);
+        return m_kFindings.Add({EFailure::Changed});
     m_spText->Forget();
     CMotionFile motion;
     if (motion.Load(path))
         facts_ = CheckPoses(motion, &m_spText->Outline(), m_kFindings);
     // Faults found in the text are the ones that made the reader fail.
     else if (!m_kFindings.HasErrors())
-        m_kFindings.AddReader(motion.Record().Failure(), ESeverity::Error);
+        m_kFindings.Add(motion.Record().Failure());
 }
 
 bool CFileExam::WriteMended(const std::string& path)
@@ -43,13 +43,13 @@ bool CFileExam::WriteMended(const std::string& path)
 void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record)
 {
     if (record.Failure() && IsPointer(path))
-        return m_kFindings.Add(EFault::LfsPointer, 1);
+        return m_kFindings.Add(EFailure::LfsPointer, 1);
     if (record.Failure())
-        m_kFindings.AddReader(record.Failure(), ESeverity::Error);
-    for (const CFailure& warning : record.Warnings())
+        m_kFindings.Add(record.Failure());
+    for (const Finding& warning : record.Warnings())
     {
         if (warning.reason != EFailure::RestPose) // reported with the facts
-            m_kFindings.AddReader(warning, ESeverity::Warning);
+            m_kFindings.Add(warning);
     }
 }
 

@@ -9,38 +9,54 @@ namespace {
 
 constexpr std::ptrdiff_t kKept = 5; // places per fault
 
+// A fault in neither list is an error that a mended copy does not have.
+constexpr EFailure kUnmended[] = {
+    EFailure::LfsPointer,     EFailure::NotText,       EFailure::SameName,    EFailure::ChannelCount,
+    EFailure::IgnoredChannel, EFailure::SecondRoot,    EFailure::RateForTime, EFailure::NoFrames,
+    EFailure::LongRow,        EFailure::NotNumber,     EFailure::StillRoot,   EFailure::SidesSwapped,
+    EFailure::WrongRate,      EFailure::MixedChannels,
+};
+constexpr EFailure kWarnings[] = {
+    EFailure::ByteOrderMark,    EFailure::BlankInName, EFailure::SameName,  EFailure::SecondRoot,
+    EFailure::RateForTime,      EFailure::SurplusRows, EFailure::NoFrames,  EFailure::DoubledBone,
+    EFailure::DoubledHipOffset, EFailure::Spike,       EFailure::StillRoot, EFailure::SidesSwapped,
+    EFailure::WrongRate,
+};
+
 bool IsFault(const Finding& finding)
 {
     return finding.severity != ESeverity::Note;
 }
 
-Finding FindingOf(EFault fault, size_t line, std::string name, bool mendable)
+bool IsMended(EFailure reason)
 {
-    return {fault, line, std::move(name), RowOf(fault).severity, mendable, EFailure::None, 0};
+    return std::ranges::find(kUnmended, reason) == std::end(kUnmended);
+}
+
+ESeverity SeverityOf(EFailure reason)
+{
+    if (reason == EFailure::MixedChannels)
+        return ESeverity::Note;
+    const bool warns = std::ranges::find(kWarnings, reason) != std::end(kWarnings);
+    return warns ? ESeverity::Warning : ESeverity::Error;
 }
 
 } // namespace
 
-void CFindings::Add(EFault fault, size_t line, std::string name)
+void CFindings::Add(EFailure reason, size_t line, std::string name)
 {
-    Keep(FindingOf(fault, line, std::move(name), RowOf(fault).mends));
+    Add({reason, line, std::move(name), SeverityOf(reason), IsMended(reason)});
 }
 
-void CFindings::AddUnmended(EFault fault, size_t line, std::string name)
+void CFindings::AddUnmended(EFailure reason, size_t line, std::string name)
 {
-    Keep(FindingOf(fault, line, std::move(name), false));
+    Add({reason, line, std::move(name), SeverityOf(reason)});
 }
 
-void CFindings::AddReader(const CFailure& failure, ESeverity severity)
-{
-    Keep({EFault::Reader, failure.where, failure.name, severity, false, failure.reason, 0});
-}
-
-void CFindings::Keep(const Finding& finding)
+void CFindings::Add(const Finding& finding)
 {
     const auto isAlike = [&](const Finding& kept) {
-        return kept.fault == finding.fault && kept.mendable == finding.mendable &&
-               kept.reason == finding.reason;
+        return kept.reason == finding.reason && kept.mendable == finding.mendable;
     };
     if (std::ranges::count_if(m_kFindings, isAlike) < kKept)
         m_kFindings.push_back(finding);
@@ -55,9 +71,9 @@ std::vector<Finding> CFindings::Sorted() const
     return sorted;
 }
 
-bool CFindings::Has(EFault fault) const
+bool CFindings::Has(EFailure reason) const
 {
-    return std::ranges::find(m_kFindings, fault, &Finding::fault) != m_kFindings.end();
+    return std::ranges::find(m_kFindings, reason, &Finding::reason) != m_kFindings.end();
 }
 
 bool CFindings::HasErrors() const

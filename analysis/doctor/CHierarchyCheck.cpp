@@ -86,9 +86,9 @@ void CHierarchyCheck::PartLines()
         if (std::exchange(told, line) == line)
             continue;
         if (closed)
-            findings_.Add(EFault::BraceOnLine, line);
+            findings_.Add(EFailure::BraceOnLine, line);
         else
-            findings_.AddUnmended(EFault::BraceOnLine, line);
+            findings_.AddUnmended(EFailure::BraceOnLine, line);
     }
 }
 
@@ -109,7 +109,7 @@ void CHierarchyCheck::CheckSpelling(std::string_view word, std::string_view want
 {
     if (word == wanted)
         return;
-    findings_.Add(EFault::KeywordSpelling, lines_.Number(), std::string(word));
+    findings_.Add(EFailure::KeywordSpelling, lines_.Number(), std::string(word));
     edits_.Replace(lines_.OffsetOf(word), word.size(), wanted);
 }
 
@@ -117,7 +117,7 @@ void CHierarchyCheck::OpenRoot(std::string_view name)
 {
     if (++m_uiRoots > 1)
     {
-        findings_.Add(EFault::SecondRoot, lines_.Number(), Quote(NextToken(name)));
+        findings_.Add(EFailure::SecondRoot, lines_.Number(), Quote(NextToken(name)));
         return m_kOpen.push_back({OutlineJoint::kNoParent});
     }
     Add(name, OutlineJoint::kNoParent);
@@ -157,7 +157,7 @@ std::string CHierarchyCheck::ReadName(std::string_view name)
     const std::string_view whole(first.data(), static_cast<size_t>(end - first.data()));
     if (whole.size() == first.size())
         return joined;
-    findings_.Add(EFault::BlankInName, lines_.Number(), Quote(whole));
+    findings_.Add(EFailure::BlankInName, lines_.Number(), Quote(whole));
     edits_.Replace(lines_.OffsetOf(whole), whole.size(), joined);
     return joined;
 }
@@ -188,7 +188,7 @@ void CHierarchyCheck::ReadOffset(std::string_view numbers)
     if (HasDecimalCommas(numbers, 3))
     {
         points = WithPoints(numbers);
-        findings_.Add(EFault::DecimalComma, lines_.Number());
+        findings_.Add(EFailure::DecimalComma, lines_.Number());
         edits_.Replace(lines_.OffsetOf(numbers), numbers.size(), points);
         numbers = points;
     }
@@ -197,7 +197,7 @@ void CHierarchyCheck::ReadOffset(std::string_view numbers)
     {
         const std::string_view token = NextToken(numbers);
         ScanFloat(token, *component);
-        if (const auto fault = FaultOfNumber(token); fault && !token.empty())
+        if (const auto fault = FailureOfNumber(token); fault && !token.empty())
             findings_.AddUnmended(*fault, lines_.Number(), Quote(token));
     }
     if (OutlineJoint* const joint = Joint())
@@ -222,7 +222,7 @@ void CHierarchyCheck::ReadChannels(std::string_view rest)
         channels.push_back(channel);
     }
     if (channels.size() > count)
-        findings_.Add(EFault::ChannelCount, lines_.Number());
+        findings_.Add(EFailure::ChannelCount, lines_.Number());
     if (OutlineJoint* const joint = Joint())
         joint->channels = std::move(channels);
 }
@@ -230,7 +230,7 @@ void CHierarchyCheck::ReadChannels(std::string_view rest)
 void CHierarchyCheck::CheckChannel(std::string_view word, int channel)
 {
     if (channel == OutlineJoint::kNoChannel)
-        findings_.Add(EFault::UnknownChannel, lines_.Number(), Quote(word));
+        findings_.Add(EFailure::IgnoredChannel, lines_.Number(), Quote(word));
     else
         CheckSpelling(word, kChannelNames[channel]);
 }

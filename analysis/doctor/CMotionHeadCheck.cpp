@@ -66,7 +66,7 @@ bool CMotionHeadCheck::SkipEmptyLines()
     {
         if (!lines_.IsBlank())
             return true;
-        findings_.Add(EFault::EmptyLineBeforeFrames, lines_.Number());
+        findings_.Add(EFailure::EmptyLineBeforeFrames, lines_.Number());
         const size_t begin = lines_.OffsetOf(lines_.Line());
         edits_.Replace(begin, lines_.NextOffset() - begin, "");
     }
@@ -86,7 +86,7 @@ bool CMotionHeadCheck::NextValue(std::string_view keyword, std::string_view& val
     value.remove_prefix(begin);
     if (!value.empty() && !IsSpelled(keyword, line))
     {
-        findings_.Add(EFault::KeywordSpelling, lines_.Number(), Quote(line));
+        findings_.Add(EFailure::KeywordSpelling, lines_.Number(), Quote(line));
         edits_.Replace(lines_.OffsetOf(line), line.size() - value.size(), std::string(keyword) + ' ');
     }
     return !value.empty();
@@ -114,13 +114,13 @@ bool CMotionHeadCheck::ReadFrameTime(BVHOutline& outline)
     if (HasDecimalCommas(value, 1))
     {
         points = WithPoints(value);
-        findings_.Add(EFault::DecimalComma, lines_.Number());
+        findings_.Add(EFailure::DecimalComma, lines_.Number());
         edits_.Replace(lines_.OffsetOf(value), value.size(), points);
         value = points;
     }
     outline.frameTimeLine = lines_.Number();
     if (ParseDouble(NextToken(value)) >= kLongestFrame)
-        findings_.Add(EFault::RateForTime, lines_.Number());
+        findings_.Add(EFailure::RateForTime, lines_.Number());
     return true;
 }
 

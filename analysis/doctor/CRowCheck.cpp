@@ -58,14 +58,14 @@ bool CRowCheck::IsPastRows(std::string_view line) const
         return false;
     if (!HasDecimalCommas(line, outline_.columnCount) && CountTokens(line) != outline_.columnCount)
         return true;
-    return FaultOfNumber(NextToken(line)).has_value();
+    return FailureOfNumber(NextToken(line)).has_value();
 }
 
 void CRowCheck::TellEmptyLines()
 {
-    const EFault fault = m_uiRows == 0 ? EFault::EmptyLineBeforeFrames : EFault::EmptyLineInRows;
+    const EFailure reason = m_uiRows == 0 ? EFailure::EmptyLineBeforeFrames : EFailure::EmptyLineInRows;
     for (size_t i = 0; i < m_uiEmptyLines; ++i)
-        findings_.Add(fault, m_uiFirstEmptyLine + i);
+        findings_.Add(reason, m_uiFirstEmptyLine + i);
     m_uiEmptyLines = 0;
 }
 
@@ -75,9 +75,9 @@ void CRowCheck::TellShortRow(bool isLast)
     if (m_uiShortLine == 0)
         return;
     if (isLast && m_uiRows > 1)
-        findings_.Add(EFault::ShortRow, m_uiShortLine);
+        findings_.Add(EFailure::CutRow, m_uiShortLine);
     else
-        findings_.AddUnmended(EFault::ShortRow, m_uiShortLine);
+        findings_.AddUnmended(EFailure::CutRow, m_uiShortLine);
     m_kPlan.dropsLast = isLast && m_uiRows > 1;
     m_uiShortLine = 0;
 }
@@ -87,7 +87,7 @@ void CRowCheck::ReadRow(std::string_view row, size_t line)
     std::string points;
     if (HasDecimalCommas(row, outline_.columnCount))
     {
-        findings_.Add(EFault::DecimalComma, line);
+        findings_.Add(EFailure::DecimalComma, line);
         points = WithPoints(row);
         row = points;
     }
@@ -95,7 +95,7 @@ void CRowCheck::ReadRow(std::string_view row, size_t line)
     const bool whole = count >= outline_.columnCount;
     TellBadTokens(whole, line);
     if (count > outline_.columnCount)
-        findings_.Add(EFault::LongRow, line);
+        findings_.Add(EFailure::LongRow, line);
     if (whole)
         m_kTable.Append(m_kRow, line);
     else
@@ -130,9 +130,9 @@ size_t CRowCheck::ReadValues(std::string_view row)
 
 void CRowCheck::JudgeToken(std::string_view token, size_t column)
 {
-    const EFault fault = FaultOfNumber(token).value_or(EFault::StuckNumber);
-    m_kBadTokens.push_back({column, token, fault});
-    if (fault == EFault::NaN)
+    const EFailure reason = FailureOfNumber(token).value_or(EFailure::NotNumber);
+    m_kBadTokens.push_back({column, token, reason});
+    if (reason == EFailure::NaN)
         m_kRow[column] = std::nanf("");
 }
 
@@ -142,10 +142,10 @@ void CRowCheck::TellBadTokens(bool whole, size_t line)
     const auto row = static_cast<uint32_t>(m_kTable.RowCount());
     for (const BadToken& token : m_kBadTokens)
     {
-        if (whole && token.fault == EFault::NaN)
+        if (whole && token.reason == EFailure::NaN)
             m_kBadCells.push_back({row, static_cast<uint32_t>(token.column)});
         else
-            findings_.AddUnmended(token.fault, line, Quote(token.text));
+            findings_.AddUnmended(token.reason, line, Quote(token.text));
     }
 }
 
@@ -156,11 +156,12 @@ void CRowCheck::CompareCounts()
     m_kPlan.rowCount = m_uiRows - m_kPlan.dropsLast;
     m_kPlan.correctsCount = m_uiRows > 0 && m_kPlan.rowCount != promised;
     if (m_uiRows == 0 && promised == 0)
-        findings_.Add(EFault::NoFrames, outline_.framesLine);
+        findings_.Add(EFailure::NoFrames, outline_.framesLine);
     else if (m_uiRows == 0)
-        findings_.AddUnmended(EFault::MissingRows, outline_.framesLine);
+        findings_.AddUnmended(EFailure::MissingRows, outline_.framesLine);
     else if (m_uiRows != promised)
-        findings_.Add(m_uiRows < promised ? EFault::MissingRows : EFault::SurplusRows, outline_.framesLine);
+        findings_.Add(m_uiRows < promised ? EFailure::MissingRows : EFailure::SurplusRows,
+                      outline_.framesLine);
 }
 
 void CRowCheck::MendCells()
@@ -170,9 +171,9 @@ void CRowCheck::MendCells()
     {
         const size_t line = m_kTable.LineOf(m_kBadCells[i].row);
         if (MeanOfNeighbours(m_kBadCells[i], values[i]))
-            findings_.Add(EFault::NaN, line);
+            findings_.Add(EFailure::NaN, line);
         else
-            findings_.AddUnmended(EFault::NaN, line);
+            findings_.AddUnmended(EFailure::NaN, line);
     }
     for (size_t i = 0; i < values.size(); ++i)
     {

@@ -3,7 +3,7 @@
 #include "BVHOutline.h"
 #include "CLineCursor.h"
 #include "CRowTable.h"
-#include "Fault.h"
+#include "Finding.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -42,7 +42,7 @@ private:
     {
         size_t column;
         std::string_view text;
-        EFault fault;
+        EFailure reason;
     };
     struct BadCell
     {

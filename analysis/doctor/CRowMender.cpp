@@ -95,7 +95,7 @@ void CRowMender::AppendValue(std::string_view token, size_t column)
     double value = ParseDouble(token);
     while (IsCellOf(column)) // the later of two repairs counts
         value = static_cast<double>(m_kCells[m_uiNextCell++].value);
-    if (mended || (less != 0.0f && !FaultOfNumber(token)))
+    if (mended || (less != 0.0f && !FailureOfNumber(token)))
         AppendFixed6(m_kOut, static_cast<float>(value - static_cast<double>(less)));
     else
         m_kOut += token;

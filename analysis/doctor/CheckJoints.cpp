@@ -19,7 +19,7 @@ void LookForSameNames(const BVHOutline& outline, CFindings& findings)
     for (const OutlineJoint& joint : outline.joints)
     {
         if (!joint.name.empty() && !names.insert(joint.name).second)
-            findings.Add(EFault::SameName, joint.line, joint.name);
+            findings.Add(EFailure::SameName, joint.line, joint.name);
     }
 }
 
@@ -43,7 +43,7 @@ void LookForMixedChannels(const BVHOutline& outline, CFindings& findings)
         if (usual.empty())
             usual = order;
         if (!order.empty() && order != usual)
-            return findings.Add(EFault::MixedChannels, joint.line, joint.name);
+            return findings.Add(EFailure::MixedChannels, joint.line, joint.name);
     }
 }
 

@@ -98,7 +98,7 @@ private:
         const CPositions positions(root, table_);
         if (!positions.AreThere() || !HoldsHeight(root, positions))
             return;
-        findings_.Add(EFault::DoubledHipOffset, root.offsetLine, root.name);
+        findings_.Add(EFailure::DoubledHipOffset, root.offsetLine, root.name);
         Subtract(root, positions);
     }
     // The up axis is unknown here, so the height must be repeated along some axis of both.
@@ -121,7 +121,7 @@ private:
             first = FirstRepeatingIn(row);
         if (!first)
             return;
-        findings_.Add(EFault::DoubledOffset, first->offsetLine, first->name);
+        findings_.Add(EFailure::DoubledBone, first->offsetLine, first->name);
         for (const OutlineJoint& joint : outline_.joints)
         {
             const CPositions positions(joint, table_);

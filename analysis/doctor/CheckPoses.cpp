@@ -71,7 +71,7 @@ public:
         {
             const CKeyframeControl* const below = TrackOf(*child);
             if (below && least > 0.0 && Travel(*below) >= least)
-                return Add(EFault::StillRoot, root_);
+                return Add(EFailure::StillRoot, root_);
         }
     }
 
@@ -80,10 +80,10 @@ public:
     {
         const CBodyMap named = FindBodyByNames(root_);
         const std::vector<BodyDoubt> doubts = CheckBody(named);
-        const auto doubt = std::ranges::find(doubts, EBodyDoubt::SidesSwapped, &BodyDoubt::kind);
+        const auto doubt = std::ranges::find(doubts, EDoubt::SidesSwapped, &BodyDoubt::kind);
         const CNode* const joint = doubt == doubts.end() ? nullptr : JointAt(named, doubt->place);
         if (joint)
-            Add(EFault::SidesSwapped, *joint);
+            Add(EFailure::SidesSwapped, *joint);
     }
 
     // A rate written in place of a frame time shows even without a gait.
@@ -91,14 +91,15 @@ public:
     {
         const std::optional<Gait> gait = FindGait(paths, up, facts.leg);
         const double rate = 1.0 / facts.frameSeconds;
-        if (!gait || !std::isfinite(rate) || !IsOtherRate(*gait, rate) || findings_.Has(EFault::RateForTime))
+        if (!gait || !std::isfinite(rate) || !IsOtherRate(*gait, rate) ||
+            findings_.Has(EFailure::RateForTime))
             return;
-        findings_.Add(EFault::WrongRate, m_pkOutline ? m_pkOutline->frameTimeLine : 0,
+        findings_.Add(EFailure::WrongRate, m_pkOutline ? m_pkOutline->frameTimeLine : 0,
                       RateWords(rate, gait->UsualRate()));
     }
 
 private:
-    void Add(EFault fault, const CNode& node)
+    void Add(EFailure fault, const CNode& node)
     {
         findings_.Add(fault, LineOf(node), std::string(node.NameView()));
     }

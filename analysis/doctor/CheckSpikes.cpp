@@ -79,10 +79,10 @@ private:
             const size_t line = table_.LineOf(spike.first);
             if (spike.count > 1)
             {
-                findings_.AddUnmended(EFault::Spike, line, joint.name);
+                findings_.AddUnmended(EFailure::Spike, line, joint.name);
                 continue;
             }
-            findings_.Add(EFault::Spike, line, joint.name);
+            findings_.Add(EFailure::Spike, line, joint.name);
             Mend(joint, spike.first, columns);
         }
     }

@@ -93,7 +93,7 @@ private:
     {
         const size_t length = m_kRest.size() - SkipByteOrderMark(m_kRest).size();
         if (length > 0)
-            Replace(EFault::ByteOrderMark, length, "", "");
+            Replace(EFailure::ByteOrderMark, length, "", "");
     }
     void Judge()
     {
@@ -105,7 +105,7 @@ private:
         const auto* const stray = std::ranges::find_if(kStrays, isHere);
         if (stray == std::end(kStrays))
             return Keep(1);
-        Replace(EFault::StrayCharacter, stray->bytes.size(), stray->instead, stray->what);
+        Replace(EFailure::StrayCharacter, stray->bytes.size(), stray->instead, stray->what);
     }
     // If the whole text has no line feed, these are its line ends. Otherwise a return is a blank at best, and
     // before a complete line end it comes from converting line ends twice.
@@ -114,13 +114,13 @@ private:
         if (m_kRest.starts_with("\r\n"))
             return Keep(2);
         const bool again = m_kRest.starts_with("\r\r\n");
-        Replace(EFault::CarriageReturn, 1, m_bLineFeeds ? (again ? "" : " ") : "\n", "");
+        Replace(EFailure::CarriageReturn, 1, m_bLineFeeds ? (again ? "" : " ") : "\n", "");
     }
     void JudgeControl()
     {
         const size_t length =
             std::min(m_kRest.find_first_not_of(m_kRest.front()), m_kRest.size()); // one finding for a run
-        Replace(EFault::StrayCharacter, length, length == m_kRest.size() ? "" : " ",
+        Replace(EFailure::StrayCharacter, length, length == m_kRest.size() ? "" : " ",
                 Printable(m_kRest.substr(0, 1)));
     }
 
@@ -132,7 +132,7 @@ private:
             clean_ += kept;
         m_kRest.remove_prefix(length);
     }
-    void Replace(EFault fault, size_t length, std::string_view instead, std::string_view what)
+    void Replace(EFailure fault, size_t length, std::string_view instead, std::string_view what)
     {
         if (!m_bChanged)
             clean_.assign(m_kText.substr(0, m_kText.size() - m_kRest.size()));
@@ -163,12 +163,12 @@ std::string_view CleanText(std::string_view text, std::string& clean, CFindings&
 {
     if (IsLfsPointer(text))
     {
-        findings.Add(EFault::LfsPointer, 1);
+        findings.Add(EFailure::LfsPointer, 1);
         return {};
     }
     if (!IsText(text))
     {
-        findings.Add(EFault::NotText, 0);
+        findings.Add(EFailure::NotText, 0);
         return {};
     }
     clean.clear();

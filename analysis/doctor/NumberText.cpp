@@ -53,7 +53,7 @@ std::string WithPoints(std::string_view text)
     return points;
 }
 
-std::optional<EFault> FaultOfNumber(std::string_view token)
+std::optional<EFailure> FailureOfNumber(std::string_view token)
 {
     ENumber kind;
     float value = 0.0f;
@@ -61,8 +61,8 @@ std::optional<EFault> FaultOfNumber(std::string_view token)
     if (kind == ENumber::Whole && std::isfinite(value))
         return std::nullopt;
     if (kind == ENumber::Unusual || kind == ENumber::Whole || token.find(kOddNumberMark) != token.npos)
-        return EFault::NaN;
-    return EFault::StuckNumber;
+        return EFailure::NaN;
+    return EFailure::NotNumber;
 }
 
 } // namespace gw

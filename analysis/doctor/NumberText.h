@@ -1,6 +1,6 @@
 #pragma once
 
-#include "Fault.h"
+#include "Finding.h"
 #include "Text.h"
 
 #include <cstddef>
@@ -21,6 +21,6 @@ std::string WithPoints(std::string_view text);
 
 /// Returns what is wrong with a token that should be a 32-bit number: NaN for anything not finite, in all the
 /// spellings that programs print, or StuckNumber. Nothing for a plain number.
-std::optional<EFault> FaultOfNumber(std::string_view token);
+std::optional<EFailure> FailureOfNumber(std::string_view token);
 
 } // namespace gw

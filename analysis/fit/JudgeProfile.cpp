@@ -50,7 +50,7 @@ void CompareNames(const CBodyMap& body, const CBodyMap& byNames, ProfileVerdict&
         CNode* const joint = JointAt(body, place);
         CNode* const named = JointAt(byNames, place);
         if (joint && named && !IsSamePlace(place, byNames, joint))
-            verdict.doubts.push_back({EProfileDoubt::OtherName, {}, NameOf(joint), NameOf(named)});
+            verdict.doubts.push_back({EDoubt::OtherName, NameOf(joint), NameOf(named)});
     }
 }
 
@@ -80,7 +80,7 @@ void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdic
         return;
     verdict.leftOut = static_cast<size_t>(body.spine.end() - place - 1);
     if (verdict.leftOut > 0)
-        verdict.doubts.push_back({EProfileDoubt::SpineCut, {}, NameOf(chest), NameOf(body.spine.back())});
+        verdict.doubts.push_back({EDoubt::SpineCut, NameOf(chest), NameOf(body.spine.back())});
 }
 
 void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
@@ -91,16 +91,14 @@ void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBody
     {
         verdict.turn += turn.degrees / static_cast<double>(turns.size());
         if (turn.degrees > kAcross)
-            verdict.doubts.push_back({EProfileDoubt::Turned, {}, NameOf(table.SourceOf(turn.target)), {}});
+            verdict.doubts.push_back({EDoubt::Turned, NameOf(table.SourceOf(turn.target)), {}});
     }
 }
 
 ESureness SurenessOf(const std::vector<ProfileDoubt>& doubts)
 {
     // A body can have unusual proportions.
-    const auto isGrave = [](const ProfileDoubt& doubt) {
-        return doubt.kind == EProfileDoubt::Places && doubt.places != EBodyDoubt::OddLength;
-    };
+    const auto isGrave = [](const ProfileDoubt& doubt) { return doubt.kind < EDoubt::OddLength; };
     if (std::ranges::any_of(doubts, isGrave))
         return ESureness::Doubtful;
     return doubts.empty() ? ESureness::Sure : ESureness::Likely;
@@ -126,7 +124,7 @@ ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets,
     AddUntold(source.byNames, body);
     ProfileVerdict verdict;
     for (const BodyDoubt& doubt : source.Check(body))
-        verdict.doubts.push_back({EProfileDoubt::Places, doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
+        verdict.doubts.push_back({doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
     CheckSpine(body, table.SourceOf(targets.Find(kTorsoBone)), verdict);
     CheckTurns(table, targets, body, StanceIn(source.tree, 0, body), verdict);

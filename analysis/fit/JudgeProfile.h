@@ -22,27 +22,12 @@ enum class ESureness : uint8_t
     Doubtful, ///< the joints' positions contradict it
 };
 
-/// A doubt about a profile.
-enum class EProfileDoubt : uint8_t
-{
-    Places,    ///< these joints cannot form a body; see `places`
-    OtherName, ///< the joint's name says that it is a different part, which is `other` here
-    SpineCut,  ///< leaves out spine joints above the one that drives the upper torso
-    Turned,    ///< the bone is rotated by about a quarter turn or more
-};
-
-/// Returns whether a doubt concerns the joints' roles, not the rotation of bones.
-constexpr bool IsOfRoles(EProfileDoubt kind)
-{
-    return kind == EProfileDoubt::Places || kind == EProfileDoubt::OtherName;
-}
-
+/// What speaks against a profile, and the joints concerned.
 struct ProfileDoubt
 {
-    EProfileDoubt kind = EProfileDoubt::Places;
-    EBodyDoubt places = EBodyDoubt::NotBelow; ///< if kind is Places
-    std::string joint;                        ///< a source joint's name
-    std::string other;                        ///< another one's name, or empty
+    EDoubt kind = EDoubt::NotBelow;
+    std::string joint; ///< name of a joint of the source
+    std::string other; ///< of OtherName, what that name stands for here; of SpineCut, the last joint left out
 };
 
 /// The verdict on a profile whose rows all fit.

@@ -40,8 +40,8 @@ struct SuggestedRow
     RowNumbers numbers;
     EBodyEvidence evidence = EBodyEvidence::None;
     ERowSureness sureness = ERowSureness::Sure;
-    std::vector<EBodyDoubt> doubts; ///< concerning this joint
-    bool nudged = false;            ///< twist slightly off, to keep a bone below away from a pole
+    std::vector<EDoubt> doubts; ///< concerning this joint
+    bool nudged = false;        ///< twist slightly off, to keep a bone below away from a pole
     /// Angle in degrees between both bones' directions in the source's rest pose; nothing if one has no
     /// direction.
     std::optional<double> restError;

@@ -21,7 +21,7 @@ void SetPair(std::vector<BonePair>& pairs, const BonePair& pair)
 } // namespace
 
 bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
-                   std::vector<BonePair>& pairs, std::vector<PairMisfit>& misfits)
+                   std::vector<BonePair>& pairs, std::vector<MissingBone>& missing)
 {
     std::string text;
     if (!ReadProfileText(profilePath, text))
@@ -36,9 +36,10 @@ bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* res
         const BonePair pair{targets.Find(line.target), sources.Find(line.source)};
         if (pair.target && pair.source)
             SetPair(pairs, pair);
+        else if (!pair.source)
+            missing.push_back({ESkeletonSide::Source, line.source, {}, 0, line.line});
         else
-            misfits.push_back(
-                {line.line, line.source, line.target, pair.source != nullptr, pair.target != nullptr});
+            missing.push_back({ESkeletonSide::Target, line.target, {}, 0, line.line});
     }
     return true;
 }

@@ -1,6 +1,7 @@
 #pragma once
 
-#include <cstddef>
+#include "ProfileFit.h"
+
 #include <span>
 #include <string>
 #include <unordered_map>
@@ -17,21 +18,11 @@ struct BonePair
     CNode* source = nullptr;
 };
 
-/// A mapping row with a missing bone.
-struct PairMisfit
-{
-    size_t line = 0; ///< in the profile, starting at 1
-    std::string source;
-    std::string target;
-    bool sourceFound = false;
-    bool targetFound = false;
-};
-
 /// Reads the bone pairs of a profile, in row order. If a target has two rows, the later one counts; fixed
-/// rows pair nothing. Rows that do not fit go to `misfits`. Returns false, changing nothing, if the profile
-/// cannot be read.
+/// rows pair nothing. For each row that does not fit, `missing` gets its source, or else its target. Returns
+/// false, changing nothing, if the profile cannot be read.
 bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
-                   std::vector<BonePair>& pairs, std::vector<PairMisfit>& misfits);
+                   std::vector<BonePair>& pairs, std::vector<MissingBone>& missing);
 
 /// Maps targets to their sources.
 class CSourceTable

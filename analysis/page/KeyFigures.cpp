@@ -78,7 +78,7 @@ Optional Of(const ConversionMeasures& measures, const ConversionDetail&)
     return measures.*member;
 }
 
-struct Row
+struct KeyRow
 {
     std::string_view key;
     std::string_view label;
@@ -94,7 +94,7 @@ struct Row
 using Sums = ConversionMeasures;
 
 // clang-format off
-constexpr Row kRows[] = {
+constexpr KeyRow kRows[] = {
     {"directionError", "Direction error", "°", 1, EIdeal::Least, 3.0, 5.0, DirectionError,
      "How far the main bones point away from the source's, as an angle: the mean over bones and frames."},
     {"trunkMean", "Trunk, mean", "°", 1, EIdeal::Least, 2.0, 4.0, Of<&Sums::trunkMean>,
@@ -150,7 +150,7 @@ double Distance(EIdeal ideal, double value)
     }
 }
 
-EVerdict VerdictOf(const Row& row, const Optional& value)
+EVerdict VerdictOf(const KeyRow& row, const Optional& value)
 {
     const double sign = row.ideal == EIdeal::Largest ? -1.0 : 1.0;
     if (!value)
@@ -168,7 +168,7 @@ std::string Shortest(double value)
     return text;
 }
 
-std::string MarkOf(const Row& row)
+std::string MarkOf(const KeyRow& row)
 {
     constexpr const char* kBefore[] = {"to ", "from ", "within ", "within "};
     const auto before = kBefore[static_cast<size_t>(row.ideal)];
@@ -201,7 +201,7 @@ size_t KeyFigureCount()
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail)
 {
     std::vector<KeyFigure> figures;
-    for (const Row& row : kRows)
+    for (const KeyRow& row : kRows)
     {
         const Optional value = row.value(measures, detail);
         figures.push_back({row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value),

@@ -3,7 +3,7 @@
 #include "ToolStatus.h"
 
 #include "CMotionFile.h"
-#include "FailureWords.h"
+#include "FindingWords.h"
 #include "Paths.h"
 #include "Text.h"
 
@@ -31,11 +31,6 @@ std::string FrameCount(const CMotionFile& motion)
     return Counted(static_cast<size_t>(motion.GetKeyCount()), "frame");
 }
 
-std::string Said(const std::string& path, const CFailure& failure, bool warning)
-{
-    return ReportLine(MakeReport(FileName(path), failure, warning));
-}
-
 // Reasons with a different meaning when saving than when loading.
 struct SaveWords
 {
@@ -54,30 +49,29 @@ std::string LoadedWords(const std::string& path, const CMotionFile& motion, cons
 {
     std::string words = Printable(FileName(path)) + ": " + FrameCount(motion);
     if (!record.Warnings().empty())
-        words += "; " + MakeReport(path, record.Warnings().front(), true).words;
+        words += "; " + MakeNotice(path, record.Warnings().front()).words;
     return words;
 }
 
-std::string FailedWords(const std::string& path, const CFailure& failure)
+std::string FailedWords(const std::string& path, const Finding& failure)
 {
-    return Said(path, failure, false);
+    return NoticeLine(MakeNotice(FileName(path), failure));
 }
 
-std::string NotSavedWords(const std::string& path, const CFailure& failure)
+std::string NotSavedWords(const std::string& path, const Finding& failure)
 {
     const auto* const found = std::ranges::find(kSaveWords, failure.reason, &SaveWords::m_eReason);
     const std::string why =
-        found == std::end(kSaveWords) ? MakeReport(path, failure, false).words : std::string(found->m_kWords);
+        found == std::end(kSaveWords) ? MakeNotice(path, failure).words : std::string(found->m_kWords);
     return "Not saved: " + Printable(FileName(path)) + ": " + why;
 }
 
 std::string ConvertedWords(const CMotionFile& result, const CFailureRecord& record)
 {
     if (record.Failure())
-        return "Not converted: " + MakeReport({}, record.Failure(), false).words;
+        return "Not converted: " + MakeNotice({}, record.Failure()).words;
     const std::string words = "Converted " + FrameCount(result);
-    return record.Warnings().empty() ? words
-                                     : words + "; " + MakeReport({}, record.Warnings().front(), true).words;
+    return record.Warnings().empty() ? words : words + "; " + MakeNotice({}, record.Warnings().front()).words;
 }
 
 std::string SavedWords(const std::string& path)

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CFailure.h"
+#include "CFailureRecord.h"
 
 #include <cstddef>
 #include <string>
@@ -14,9 +14,9 @@ class CMotionFile;
 /// A motion was loaded; includes only the first warning.
 std::string LoadedWords(const std::string& path, const CMotionFile& motion, const CFailureRecord& record);
 /// Text for a file that could not be read.
-std::string FailedWords(const std::string& path, const CFailure& failure);
+std::string FailedWords(const std::string& path, const Finding& failure);
 /// Text for a result that could not be saved.
-std::string NotSavedWords(const std::string& path, const CFailure& failure);
+std::string NotSavedWords(const std::string& path, const Finding& failure);
 std::string ConvertedWords(const CMotionFile& result, const CFailureRecord& record);
 /// Text for a file that was written.
 std::string SavedWords(const std::string& path);

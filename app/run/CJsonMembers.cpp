@@ -124,15 +124,15 @@ private:
 
 } // namespace
 
-EJsonFault CJsonMembers::Read(std::string_view text)
+EFailure CJsonMembers::Read(std::string_view text)
 {
     *this = {};
     CMemberCollector collector;
     if (!nlohmann::json::sax_parse(text, &collector))
-        return collector.IsTooDeep() ? EJsonFault::TooDeep : EJsonFault::NotJson;
+        return collector.IsTooDeep() ? EFailure::TooDeep : EFailure::UnexpectedLine;
     m_bObject = collector.IsObject();
     m_kMembers = collector.TakeMembers();
-    return EJsonFault::None;
+    return EFailure::None;
 }
 
 const Member* CJsonMembers::Find(std::string_view key) const

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Finding.h"
+
 #include <cstddef>
 #include <cstdint>
 #include <string>
@@ -8,15 +10,8 @@
 
 namespace gw {
 
-/// Our own JSON lines have four levels (values in reports in a list in a line).
+/// Our own JSON lines have four levels (values in notices in a list in a line).
 inline constexpr size_t kJsonDepthLimit = 16;
-
-enum class EJsonFault : uint8_t
-{
-    None,
-    NotJson,
-    TooDeep, ///< nested deeper than kJsonDepthLimit
-};
 
 /// The members of a JSON object, or the elements of an array (with empty keys). Nested objects and arrays
 /// stay text, to be parsed in turn. No tree is built, because destroying a tree of the JSON library allocates
@@ -43,8 +38,9 @@ public:
         std::string text = {}; ///< for Text or Nested
     };
 
-    /// Parses a whole text. If that fails, there are no members.
-    EJsonFault Read(std::string_view text);
+    /// Parses a whole text. Returns UnexpectedLine if it is not JSON, TooDeep if it is nested deeper than
+    /// kJsonDepthLimit; then there are no members.
+    EFailure Read(std::string_view text);
 
     /// Returns false for an array.
     bool IsObject() const { return m_bObject; }

@@ -61,7 +61,7 @@ void CResumeState::TakeLine(std::string_view line, bool isSynced)
 {
     CJsonMembers json;
     std::string output;
-    if (json.Read(line) != EJsonFault::None || !json.TakeText("output", output))
+    if (json.Read(line) != EFailure::None || !json.TakeText("output", output))
         return;
     std::vector<Made>& made = m_kMade[Kept(output)];
     Made entry;

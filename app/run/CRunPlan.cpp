@@ -102,25 +102,25 @@ bool WritePlan(const std::string& path, const CRunPlan& plan)
     return good && file.Commit();
 }
 
-EPlanFault ReadPlan(const std::string& path, CRunPlan& plan, size_t& line)
+Finding ReadPlan(const std::string& path, CRunPlan& plan)
 {
     CMappedFile file;
-    if (file.Open(path) != EFailure::None)
-        return EPlanFault::Unreadable;
+    if (const EFailure failure = file.Open(path); failure != EFailure::None)
+        return {failure};
     std::string_view rest = file.Text();
-    line = 0;
+    size_t line = 0;
     for (std::string_view text; NextLine(rest, text);)
     {
         ++line;
         CJsonMembers json;
-        if (json.Read(text) == EJsonFault::TooDeep)
-            return EPlanFault::TooDeep;
+        if (json.Read(text) == EFailure::TooDeep)
+            return {EFailure::TooDeep, line};
         if (line == 1 && !TakeHead(json, plan))
-            return EPlanFault::NoPlan;
+            return {EFailure::BadHeader, line};
         if (line > 1 && !TakeEntry(json, plan))
-            return EPlanFault::BadLine;
+            return {EFailure::UnexpectedLine, line};
     }
-    return line > 0 ? EPlanFault::None : EPlanFault::NoPlan;
+    return {line > 0 ? EFailure::None : EFailure::BadHeader};
 }
 
 } // namespace gw

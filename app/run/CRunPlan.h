@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Finding.h"
+
 #include <cstddef>
 #include <cstdint>
 #include <string>
@@ -34,16 +36,8 @@ struct CRunPlan
 /// Writes a plan atomically. Returns false if the file cannot be written.
 bool WritePlan(const std::string& path, const CRunPlan& plan);
 
-enum class EPlanFault : uint8_t
-{
-    None,
-    Unreadable, ///< the file does not exist
-    NoPlan,     ///< the first line is not that of a plan
-    BadLine,    ///< another line is invalid, or names a shard that does not exist
-    TooDeep,    ///< a line is nested deeper than a plan's
-};
-
-/// Reads a plan. If a line is refused, `line` is its number, starting at 1.
-EPlanFault ReadPlan(const std::string& path, CRunPlan& plan, size_t& line);
+/// Reads a plan. Returns what failed: BadHeader if the first line is not that of a plan, UnexpectedLine if
+/// another line is invalid or names a shard that does not exist, TooDeep, or why the file cannot be read.
+Finding ReadPlan(const std::string& path, CRunPlan& plan);
 
 } // namespace gw

@@ -2,7 +2,7 @@
 
 #include "CMotionView.h"
 #include "CProfileOwner.h"
-#include "CReport.h"
+#include "Notice.h"
 
 #include <memory>
 #include <optional>
@@ -58,8 +58,8 @@ public:
     // Messages and progress
 
     /// Reports a failure or warning. Called before the fixed message of the same failure, if it has one.
-    virtual void Report(const CReport&) {}
-    /// Returns whether a person sees the reports, so that a doubtful file is examined in full.
+    virtual void Notify(const Notice&) {}
+    /// Returns whether a person sees the notices, so that a doubtful file is examined in full.
     virtual bool ShowsFindings() const { return false; }
     /// Returns whether an operation has taken long enough to show its progress.
     virtual bool IsProgressDue() { return false; }

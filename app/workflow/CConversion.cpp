@@ -10,14 +10,14 @@
 #include "CMotionFile.h"
 #include "CRetargeter.h"
 #include "CompleteBody.h"
-#include "FailureWords.h"
 #include "FindBone.h"
+#include "FindingWords.h"
 #include "FitWords.h"
 #include "HostBones.h"
 #include "Mat4.h"
 #include "ProfileFit.h"
-#include "RestMisfits.h"
 #include "Skeleton.h"
+#include "TurnedBones.h"
 
 #include <algorithm>
 #include <cmath>
@@ -78,34 +78,34 @@ bool IsAligned(EFailure reason)
 
 } // namespace
 
-void ReportRecord(const std::string& path, const CFailureRecord& record, const ConversionChoices& choices,
-                  const ReportListener& listener)
+void NotifyOfRecord(const std::string& path, const CFailureRecord& record, const ConversionChoices& choices,
+                    const NoticeListener& listener)
 {
     if (record.Failure())
-        listener(MakeReport(path, record.Failure(), false));
-    for (const CFailure& warning : record.Warnings())
+        listener(MakeNotice(path, record.Failure()));
+    for (const Finding& warning : record.Warnings())
     {
         if (!choices.align || !IsAligned(warning.reason))
-            listener(MakeReport(path, warning, true));
+            listener(MakeNotice(path, warning));
     }
 }
 
 bool CConversion::Prepare(bool doRowsFit, EAlignedJoints joints)
 {
-    const CFailure& shares = retargeter_.Record().Failure(); // the only possible failure so far
+    const Finding& shares = retargeter_.Record().Failure(); // the only possible failure so far
     if (shares)
     {
-        ReportRecord(shares.name, retargeter_.Record(), input_.choices, report_);
+        NotifyOfRecord(shares.name, retargeter_.Record(), input_.choices, notify_);
         return false;
     }
     if (!doRowsFit || !retargeter_.SourceOf(FindBone(target_.motionRoot.Get(), kRootBone)))
     {
-        ReportMisfit();
+        NotifyOfMisfit();
         return false;
     }
     if (input_.choices.align)
         return Align(joints);
-    ReportTurnedAtRest();
+    NotifyOfTurnedBones();
     return true;
 }
 
@@ -115,7 +115,7 @@ bool CConversion::Align(EAlignedJoints joints)
     CFailureRecord record;
     BodyMotion source{input_.source, input_.timing.frequency, FramesOf(input_.timing, *input_.source, record),
                       BodyOfTable(retargeter_, CNodeNames(target))};
-    ReportRecord(input_.sourcePath, record, input_.choices, report_);
+    NotifyOfRecord(input_.sourcePath, record, input_.choices, notify_);
     CompleteBody(source.body);
     if (input_.choices.faithful)
     {
@@ -127,13 +127,13 @@ bool CConversion::Align(EAlignedJoints joints)
         return false;
     if (!PlanAlignment(source, alignment))
     {
-        report_(MakeReport(input_.sourcePath, EMisfit::NoBody));
+        notify_(MakeNotice(input_.sourcePath, {EFailure::NoBody}));
         return false;
     }
     const AlignedMotion aligned = AlignMotion(source, alignment, joints);
     AimBones(retargeter_, target, source, alignment, aligned);
     aligned_ = aligned.root;
-    alignment_ = std::move(alignment.report);
+    corrections_ = std::move(alignment.corrections);
     return true;
 }
 
@@ -145,7 +145,7 @@ void CConversion::Run(bool useLegs, const std::function<void(size_t, size_t)>& p
     retargeter_.SetProgress(progress);
     retargeter_.Retarget(0.0f, input_.timing.lastFrame, 0.0f, input_.timing.frequency, kRootPosition, true,
                          useLegs);
-    ReportRecord(input_.sourcePath, retargeter_.Record(), input_.choices, report_);
+    NotifyOfRecord(input_.sourcePath, retargeter_.Record(), input_.choices, notify_);
     NormalizeBasePose();
 }
 
@@ -160,23 +160,23 @@ void CConversion::NormalizeBasePose()
     root->m_kMatrix.m[15] = 1.0f;
 }
 
-void CConversion::ReportMisfit()
+void CConversion::NotifyOfMisfit()
 {
-    EMisfit misfit = EMisfit::NoRootSource;
+    EFailure reason = EFailure::NoRootSource;
     if (!input_.source || !target_.motionRoot)
-        misfit = EMisfit::NoScene;
+        reason = EFailure::NoScene;
     else if (input_.profilePath.empty())
-        misfit = EMisfit::NoProfile;
-    else if (ReportMissingBones())
+        reason = EFailure::NoProfile;
+    else if (NotifyOfMissingBones())
         return;
     else if (input_.rows.FindTarget(kRootBone) == CMapRowTable::kNone)
-        misfit = EMisfit::NoRootRow;
-    report_(MakeReport(input_.profilePath, misfit));
+        reason = EFailure::NoRootRow;
+    notify_(MakeNotice(input_.profilePath, {reason}));
 }
 
-// Reports the rows that name missing bones; returns false if there are none. Line numbers are included if the
+// Notifies of the rows that name missing bones; returns false if there are none. Line numbers are included if the
 // profile is unchanged from its file.
-bool CConversion::ReportMissingBones()
+bool CConversion::NotifyOfMissingBones()
 {
     CNode* const target = target_.motionRoot.Get();
     CProfileFit fit;
@@ -186,24 +186,22 @@ bool CConversion::ReportMissingBones()
         fit.name = input_.profileName;
     }
     if (!fit.missing.empty())
-        report_(MisfitReport(input_.sourcePath, fit));
+        notify_(MisfitNotice(input_.sourcePath, fit));
     return !fit.missing.empty();
 }
 
 // Rows that rotate limbs at rest were made for a different rest pose. If the rest pose is not a T-pose, the
 // file's reader has already warned about it.
-void CConversion::ReportTurnedAtRest()
+void CConversion::NotifyOfTurnedBones()
 {
-    const auto isRestPose = [](const CFailure& warning) { return warning.reason == EFailure::RestPose; };
+    const auto isRestPose = [](const Finding& warning) { return warning.reason == EFailure::RestPose; };
     if (std::ranges::any_of(input_.sourceRecord.Warnings(), isRestPose))
         return;
-    const std::vector<RestMisfit> misfits = FindRestMisfits(retargeter_, *target_.motionRoot);
-    const auto worst = std::ranges::max_element(misfits, {}, &RestMisfit::degrees);
-    if (worst == misfits.end())
+    const std::vector<TurnedBone> bones = FindTurnedBones(retargeter_, *target_.motionRoot);
+    const auto worst = std::ranges::max_element(bones, {}, &TurnedBone::degrees);
+    if (worst == bones.end())
         return;
-    CReport report = MakeReport(input_.sourcePath, EMisfit::TurnedAtRest, worst->source);
-    report.warning = true;
-    report_(report);
+    notify_(MakeNotice(input_.sourcePath, {EFailure::TurnedAtRest, 0, worst->source, ESeverity::Warning}));
 }
 
 } // namespace gw

@@ -1,9 +1,9 @@
 #pragma once
 
-#include "AlignReport.h"
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CNode.h"
-#include "CReport.h"
+#include "Corrections.h"
+#include "Notice.h"
 #include "SourceTiming.h"
 #include "Vec3.h"
 
@@ -45,13 +45,13 @@ struct ConversionInput
     ConversionChoices choices;
 };
 
-/// Takes what is reported, as it comes.
-using ReportListener = std::function<void(const CReport&)>;
+/// Receives notices as they come.
+using NoticeListener = std::function<void(const Notice&)>;
 
-/// Reports what a reader, a writer or a run failed on and warned of; without the warnings of what an
-/// alignment corrects, where one is chosen.
-void ReportRecord(const std::string& path, const CFailureRecord& record, const ConversionChoices& choices,
-                  const ReportListener& listener);
+/// Notifies of what a reader, a writer or a run failed on and warned of, except for warnings of what a chosen
+/// alignment corrects.
+void NotifyOfRecord(const std::string& path, const CFailureRecord& record, const ConversionChoices& choices,
+                    const NoticeListener& listener);
 
 /// One conversion of one source onto one target. The steps: the rows fill the retargeter's tables, then
 /// Prepare, then Run.
@@ -61,36 +61,36 @@ public:
     /// Changes the target in place, which is the base skeleton as its file has it. The retargeter is a new
     /// one: its tables are keyed by the target's bones, and a bone of a target that is gone may have lain
     /// where one of the present target lies. Both must outlive the conversion.
-    CConversion(ConversionInput input, CMotionFile& target, CRetargeter& retargeter, ReportListener listener)
-        : input_(std::move(input)), target_(target), retargeter_(retargeter), report_(std::move(listener))
+    CConversion(ConversionInput input, CMotionFile& target, CRetargeter& retargeter, NoticeListener listener)
+        : input_(std::move(input)), target_(target), retargeter_(retargeter), notify_(std::move(listener))
     {
     }
 
     /// Aligns the source for the rows where that is chosen, and lets an aligned copy drive the target: the
-    /// source stays as it is. False, with the reason reported, when the tables cannot drive a conversion: not
-    /// all rows fit, or none drives the root, or they make no body that could be aligned.
+    /// source stays as it is. False, after a notice of the reason, when the tables cannot drive a conversion:
+    /// not all rows fit, or none drives the root, or they make no body that could be aligned.
     bool Prepare(bool doRowsFit, EAlignedJoints joints);
     /// Writes the motion onto the target. `progress` is told now and then the frames done and their number.
     void Run(bool useLegs, const std::function<void(size_t, size_t)>& progress = {});
 
     /// The aligned copy of the source; null where the source itself drives the target.
     CNode* Aligned() const { return aligned_.Get(); }
-    /// What the alignment found.
-    const AlignReport& AlignedReport() const { return alignment_; }
+    /// What the alignment corrected.
+    const Corrections& Corrected() const { return corrections_; }
 
 private:
     bool Align(EAlignedJoints joints);
-    void ReportMisfit();
-    bool ReportMissingBones();
-    void ReportTurnedAtRest();
+    void NotifyOfMisfit();
+    bool NotifyOfMissingBones();
+    void NotifyOfTurnedBones();
     void NormalizeBasePose();
 
     ConversionInput input_;
     CMotionFile& target_;
     CRetargeter& retargeter_;
-    ReportListener report_;
+    NoticeListener notify_;
     Ref<CNode> aligned_;
-    AlignReport alignment_;
+    Corrections corrections_;
 };
 
 } // namespace gw

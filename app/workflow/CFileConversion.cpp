@@ -6,8 +6,8 @@
 #include "AttachBoneMeshes.h"
 #include "CProfileFields.h"
 #include "CResourceManager.h"
-#include "FailureWords.h"
 #include "FindBone.h"
+#include "FindingWords.h"
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "ResultFile.h"
@@ -20,8 +20,8 @@
 namespace gw {
 
 CFileConversion::CFileConversion(const std::string& dataFolder, const ConversionChoices& choices,
-                                 ReportListener listener)
-    : platform_(EPlatformWriting::No, dataFolder), choices_(choices), report_(std::move(listener))
+                                 NoticeListener listener)
+    : platform_(EPlatformWriting::No, dataFolder), choices_(choices), notify_(std::move(listener))
 {
 }
 
@@ -36,7 +36,7 @@ std::string CFileConversion::Message(int id) const
 
 void CFileConversion::TellMessage(int id) const
 {
-    Report({false, {}, 0, kFixedMessage, {}, Message(id)});
+    Notify(MakeNotice({}, kFixedMessage, Message(id)));
 }
 
 bool CFileConversion::LoadSource(const std::string& path)
@@ -48,7 +48,7 @@ bool CFileConversion::LoadSource(const std::string& path)
         sourceRecord_ = motion_.Record();
     else if (loaded)
         AttachBoneMeshes(SourceRoot()); // as for motion files, because they define the bones' directions
-    Report(path, sourceRecord_);
+    Notify(path, sourceRecord_);
     if (!loaded)
         TellMessage(kInvalidSourceMessage);
     return loaded;
@@ -68,7 +68,7 @@ bool CFileConversion::LoadTarget()
 {
     const std::string path = DataFile(kTargetFile);
     const bool loaded = result_.Load(path);
-    Report(path, result_.Record());
+    Notify(path, result_.Record());
     return loaded;
 }
 
@@ -79,7 +79,7 @@ bool CFileConversion::UseProfile(const std::string& path)
     if (isRead)
         UseProfile(path, profile);
     else
-        Report(MakeReport(path, EMisfit::BadProfile));
+        Notify(MakeNotice(path, {EFailure::BadProfile}));
     return isRead;
 }
 
@@ -94,7 +94,7 @@ bool CFileConversion::HasFrames() const
 {
     const bool hasFrames = (isScene_ || motion_.GetKeyCount() > 0) && result_.GetKeyCount() > 0;
     if (!hasFrames)
-        Report(MakeReport(sourcePath_, EMisfit::NoFrames));
+        Notify(MakeNotice(sourcePath_, {EFailure::NothingToConvert}));
     return hasFrames;
 }
 
@@ -106,7 +106,7 @@ void CFileConversion::WarnOfNumbers() const
             return;
         const std::string limits[] = {std::to_string(low), std::to_string(high)};
         const std::string words = FormatText(Message(kNumberLimitsMessage), limits);
-        Report({true, profilePath_, line, "out-of-range", name, '"' + name + "\": " + words});
+        Notify({ESeverity::Warning, profilePath_, line, "out-of-range", name, '"' + name + "\": " + words});
     };
     const auto& [x, y, z] = profile_.position;
     const std::array place{CutToInteger(x), CutToInteger(y), CutToInteger(z)};
@@ -142,7 +142,7 @@ bool CFileConversion::Prepare(EAlignedJoints joints)
                                         .profileName = profile_.name,
                                         .rows = profile_.rows,
                                         .choices = choices_},
-                        result_, retargeter, report_);
+                        result_, retargeter, notify_);
     return conversion_->Prepare(fits, joints);
 }
 
@@ -161,7 +161,7 @@ bool CFileConversion::WriteResult(const std::string& path)
 {
     CFailureRecord record;
     const bool written = WriteResultFile(result_, path, profile_.frameRate, record);
-    Report(path, record);
+    Notify(path, record);
     return written;
 }
 
@@ -169,7 +169,7 @@ bool CFileConversion::WriteBatchResult(const std::string& path)
 {
     CFailureRecord record;
     const bool written = WriteMotionFile(result_, path, kBatchRate, profile_.frameRate, record);
-    Report(sourcePath_, record);
+    Notify(sourcePath_, record);
     return written;
 }
 
@@ -180,7 +180,7 @@ bool CFileConversion::WriteAligned(const std::string& path)
     TKBVHStream stream;
     stream.motionRoot = conversion_->Aligned();
     const bool written = stream.WriteExact(path);
-    Report(path, stream.Record());
+    Notify(path, stream.Record());
     return written;
 }
 

@@ -12,17 +12,17 @@
 
 namespace gw {
 
-/// The code of a report that is one of the program's fixed messages: "Invalid BVH file format."
+/// The code of a notice that is one of the program's fixed messages: "Invalid BVH file format."
 inline constexpr const char* kFixedMessage = "message";
 
 /// Converts files without a window. The steps are LoadSource and LoadTarget, UseProfile, Convert, and one of
-/// the writing functions; each requires the previous one to have returned true. Failures are reported before
-/// a function returns. Leaves no settings or folders behind.
+/// the writing functions; each requires the previous one to have returned true. A function that fails sends a
+/// notice first. Leaves no settings or folders behind.
 class CFileConversion
 {
 public:
     /// An empty data folder means the program's own.
-    CFileConversion(const std::string& dataFolder, const ConversionChoices& choices, ReportListener listener);
+    CFileConversion(const std::string& dataFolder, const ConversionChoices& choices, NoticeListener listener);
 
     bool LoadSource(const std::string& path);
     /// Reads the base skeleton, as needed for each conversion.
@@ -53,19 +53,19 @@ public:
     const ProfileRows& Profile() const { return profile_; }
     /// Returns the file of the current profile; empty without one.
     const std::string& ProfilePath() const { return profilePath_; }
-    /// Returns the report of the last alignment.
-    AlignReport AlignedReport() const { return conversion_ ? conversion_->AlignedReport() : AlignReport(); }
+    /// Returns what the last alignment corrected.
+    Corrections Corrected() const { return conversion_ ? conversion_->Corrected() : Corrections(); }
     /// Returns the full path of a name in the data folder.
     std::string DataFile(const std::string& name) const { return platform_.DataFolder() + name; }
     /// Returns the text of a message.
     std::string Message(int id) const;
-    void Report(const std::string& path, const CFailureRecord& record) const
+    void Notify(const std::string& path, const CFailureRecord& record) const
     {
-        ReportRecord(path, record, choices_, report_);
+        NotifyOfRecord(path, record, choices_, notify_);
     }
 
 protected:
-    void Report(const CReport& report) const { report_(report); }
+    void Notify(const Notice& notice) const { notify_(notice); }
     const CPlatform& Platform() const { return platform_; }
     const std::string& SourcePath() const { return sourcePath_; }
 
@@ -76,7 +76,7 @@ private:
 
     CFilePlatform platform_;
     ConversionChoices choices_;
-    ReportListener report_;
+    NoticeListener notify_;
     std::string sourcePath_;
     bool isScene_ = false; // whether the source is the scene or the motion below
     COrrinStream scene_;

@@ -102,12 +102,12 @@ int CGaitConvertContent::Open(const std::string& path)
         m_pkSourceView->Stop();
     if (!LoadSource(path))
     {
-        ReportFindings(path);
+        NotifyOfFindings(path);
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
         return 0;
     }
     if (!m_bSourceIsContainer && !m_kSourceMotion.Record().Warnings().empty())
-        ReportFindings(path);
+        NotifyOfFindings(path);
     m_kSourcePath = path;
     RememberFolder(path);
     AddRecentFile(path);
@@ -130,7 +130,7 @@ bool CGaitConvertContent::LoadSource(const std::string& path)
         return LoadMotion(m_kSourceMotion, path);
     CFailureRecord record;
     const bool loaded = LoadSourceScene(path, m_spkSourceScene, record);
-    Report(path, record);
+    Notify(path, record);
     m_bSourceIsContainer = m_bSourceIsContainer || loaded;
     return loaded;
 }
@@ -138,7 +138,7 @@ bool CGaitConvertContent::LoadSource(const std::string& path)
 bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& path)
 {
     const bool loaded = motion.Load(path);
-    Report(path, motion.Record());
+    Notify(path, motion.Record());
     return loaded;
 }
 
@@ -203,9 +203,9 @@ void CGaitConvertContent::ShowTitle(const std::string& text)
     window_.SetChildText("#title", text.empty() ? product : product + " - " + text);
 }
 
-void CGaitConvertContent::Report(const std::string& path, const CFailureRecord& record)
+void CGaitConvertContent::Notify(const std::string& path, const CFailureRecord& record)
 {
-    ReportRecord(path, record, m_kChoices, [this](const CReport& report) { window_.Report(report); });
+    NotifyOfRecord(path, record, m_kChoices, [this](const Notice& notice) { window_.Notify(notice); });
 }
 
 } // namespace gw

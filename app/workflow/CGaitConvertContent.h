@@ -144,7 +144,7 @@ private:
     void RememberFolder(const std::string& path);
     void ForgetFailedSave();
     std::string BaseFile() { return ExeFile(kTargetFile); }
-    void Report(const std::string& path, const CFailureRecord& record);
+    void Notify(const std::string& path, const CFailureRecord& record);
 
     // ConvertMotion.cpp
     void LoadResult();
@@ -156,7 +156,7 @@ private:
     // DraftProfile.cpp
     std::string DraftName() const;
     void OpenDraft(const std::string& name);
-    void ReportFindings(const std::string& path);
+    void NotifyOfFindings(const std::string& path);
 
     // ConvertBatch.cpp
     EBatchStep RunBatchFile(EBatchJob job, const std::string& path, size_t index);

@@ -6,7 +6,7 @@
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
 #include "CWaitCursor.h"
-#include "FailureWords.h"
+#include "FindingWords.h"
 #include "Paths.h"
 #include "StringTable.h"
 
@@ -72,7 +72,7 @@ EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::
     m_kWriteRecord.Clear();
     const bool saved =
         WriteMotionFile(m_kResultMotion, output, kBatchRate, m_pkProfile->GetFrameRate(), m_kWriteRecord);
-    Report(path, m_kWriteRecord);
+    Notify(path, m_kWriteRecord);
     return saved ? EBatchStep::Done : EBatchStep::Ended;
 }
 
@@ -83,7 +83,7 @@ bool CGaitConvertContent::SelectProfileAgain()
     const std::string* const selected = list.GetItemText(list.GetCurSel());
     if (!selected)
     {
-        window_.Report(MakeReport({}, EMisfit::NoProfile));
+        window_.Notify(MakeNotice({}, {EFailure::NoProfile}));
         ShowMessage(kCannotConvertMessage, EButtons::OK);
         return false;
     }
@@ -95,7 +95,7 @@ EBatchStep CGaitConvertContent::PackageFile(const std::string& path, const std::
 {
     CFailureRecord record;
     const bool packaged = PackageMotionFile(path, output, record);
-    Report(path, record);
+    Notify(path, record);
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 

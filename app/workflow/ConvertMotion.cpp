@@ -40,7 +40,7 @@ void CGaitConvertContent::ReloadResult()
 {
     if (!resultStamp_ || resultStamp_ != StampOf(BaseFile()))
         LoadResult();
-    Report(BaseFile(), m_kResultMotion.Record());
+    Notify(BaseFile(), m_kResultMotion.Record());
 }
 
 // Converts with the profile. If it cannot drive a conversion, reports why and returns false. The source is
@@ -51,7 +51,7 @@ bool CGaitConvertContent::Retarget(bool heedsShift)
     const bool fits =
         m_pkProfile->ApplyProfile(&retargeter, nullptr, nullptr) && m_pkProfile->HasRootMapping();
     CConversion conversion(Input(), m_kResultMotion, retargeter,
-                           [this](const CReport& report) { window_.Report(report); });
+                           [this](const Notice& notice) { window_.Notify(notice); });
     resultStamp_.reset();
     if (!conversion.Prepare(fits, EAlignedJoints::Body))
     {

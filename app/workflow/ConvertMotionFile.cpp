@@ -10,8 +10,8 @@ MotionFileResult ConvertMotionFile(const MotionFileJob& job)
 {
     MotionFileResult result;
     CFileConversion conversion(job.dataFolder, job.choices,
-                               [&](const CReport& report) { result.reports.push_back(report); });
-    const auto isGood = [&] { return std::ranges::all_of(result.reports, &CReport::warning); };
+                               [&](const Notice& notice) { result.notices.push_back(notice); });
+    const auto isGood = [&] { return std::ranges::all_of(result.notices, &Notice::IsWarning); };
     result.written = conversion.LoadSource(job.source) && conversion.LoadTarget() &&
                      conversion.UseProfile(job.profile) && conversion.HasFrames() &&
                      conversion.Convert(true) && conversion.HasFrames() && isGood() &&

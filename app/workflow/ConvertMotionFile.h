@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CConversion.h"
-#include "CReport.h"
+#include "Notice.h"
 
 #include <string>
 #include <vector>
@@ -23,7 +23,7 @@ struct MotionFileJob
 struct MotionFileResult
 {
     bool written = false;
-    std::vector<CReport> reports; ///< warnings and, if nothing was written, at least one failure
+    std::vector<Notice> notices; ///< warnings, and at least one error if nothing was written
 };
 
 /// Opens, converts and saves one motion like the window and the shell, for programs that link the engine.

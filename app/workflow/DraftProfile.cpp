@@ -7,7 +7,6 @@
 #include "CProfileEditorDialog.h"
 #include "CSafeFile.h"
 #include "CWaitCursor.h"
-#include "FailureWords.h"
 #include "FindingWords.h"
 #include "NewProfilePath.h"
 #include "Paths.h"
@@ -24,16 +23,6 @@ namespace gw {
 namespace {
 
 constexpr uint64_t kExamBytesLimit = uint64_t{64} << 20; // a person would have to wait for more
-
-CReport Note(const std::string& path, const char* code, std::string words)
-{
-    CReport report;
-    report.warning = true;
-    report.path = path;
-    report.code = code;
-    report.words = std::move(words);
-    return report;
-}
 
 // Returns the rows that a person should check, or empty.
 std::string UnsureRows(const SuggestedProfile& draft)
@@ -87,13 +76,14 @@ int CGaitConvertContent::DraftProfile()
         !file.Write(ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())) ||
         !file.Commit())
     {
-        window_.Report(MakeReport(path, {EFailure::WriteError, 0, {}}, false));
+        window_.Notify(MakeNotice(path, {EFailure::WriteError}));
         window_.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
         return 0;
     }
     OpenDraft(name);
     if (const std::string rows = UnsureRows(draft); !rows.empty())
-        window_.Report(Note(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows)));
+        window_.Notify(MakeNotice(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows),
+                                  ESeverity::Warning));
     return 1;
 }
 
@@ -108,7 +98,7 @@ void CGaitConvertContent::OpenDraft(const std::string& name)
 }
 
 // All faults that a reader ran into are reported if a person can unfold them.
-void CGaitConvertContent::ReportFindings(const std::string& path)
+void CGaitConvertContent::NotifyOfFindings(const std::string& path)
 {
     if (!window_.ShowsFindings() || !HasExtension(path, ".bvh") || !IsShort(path))
         return;
@@ -116,13 +106,8 @@ void CGaitConvertContent::ReportFindings(const std::string& path)
     exam.ExamineBVH(path);
     for (const Finding& finding : exam.Findings().Sorted())
     {
-        if (finding.severity == ESeverity::Note || finding.fault == EFault::Reader)
-            continue;
-        CReport report = Note(path, std::string(FindingCode(finding)).c_str(), FindingWords(path, finding));
-        report.where = finding.where;
-        if (!FindingRemedy(finding).empty())
-            report.words += " (" + std::string(FindingRemedy(finding)) + ')';
-        window_.Report(report);
+        if (finding.severity != ESeverity::Note && !IsOfReader(finding.reason))
+            window_.Notify(MakeNotice(path, finding));
     }
 }
 

@@ -1,7 +1,7 @@
 #include "FitWords.h"
 
-#include "CReport.h"
 #include "HostBones.h"
+#include "Notice.h"
 #include "ProfileFit.h"
 #include "Text.h"
 
@@ -44,13 +44,10 @@ std::string MissingLines(const CProfileFit& fit)
     return lines;
 }
 
-CReport MisfitReport(const std::string& source, const CProfileFit& fit)
+Notice MisfitNotice(const std::string& source, const CProfileFit& fit)
 {
-    CReport report;
-    report.path = source;
-    report.code = "misfit";
-    report.words = "profile " + Quoted(fit.name) + ": " + FitSummary(fit) + '\n' + MissingLines(fit);
-    return report;
+    const std::string summary = "profile " + Quoted(fit.name) + ": " + FitSummary(fit);
+    return MakeNotice(source, "misfit", summary + '\n' + MissingLines(fit));
 }
 
 } // namespace gw

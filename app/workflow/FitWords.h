@@ -5,7 +5,7 @@
 namespace gw {
 
 struct CProfileFit;
-struct CReport;
+struct Notice;
 enum class ESkeletonSide : unsigned char;
 
 /// Returns "source" or "target".
@@ -14,7 +14,7 @@ const char* SideName(ESkeletonSide side);
 std::string FitSummary(const CProfileFit& fit);
 /// Returns the missing bones of a profile, one line each, with the closest names.
 std::string MissingLines(const CProfileFit& fit);
-/// Returns why a profile does not fit a source; the report's code is "misfit".
-CReport MisfitReport(const std::string& source, const CProfileFit& fit);
+/// Returns why a profile does not fit a source; the notice's code is "misfit".
+Notice MisfitNotice(const std::string& source, const CProfileFit& fit);
 
 } // namespace gw

@@ -4,7 +4,7 @@
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
 #include "CWaitCursor.h"
-#include "FailureWords.h"
+#include "FindingWords.h"
 #include "ResultFile.h"
 #include "StringTable.h"
 
@@ -28,9 +28,9 @@ int CGaitConvertContent::SaveResult()
     std::string text = Message(kShowFileMessage);
     if (m_kWriteRecord.Failure())
     {
-        const CReport report = MakeReport(*path, m_kWriteRecord.Failure(), false);
-        title = kNotSaved + report.words;
-        text = "Nothing was written.\n" + ReportLine(report) + "\n\n" + text;
+        const Notice notice = MakeNotice(*path, m_kWriteRecord.Failure());
+        title = kNotSaved + notice.words;
+        text = "Nothing was written.\n" + NoticeLine(notice) + "\n\n" + text;
     }
     SetTitle(title);
     if (window_.ShowMessageBox(kShowFileMessage, text, EButtons::OKCancel) == EAnswer::OK)
@@ -49,7 +49,7 @@ bool CGaitConvertContent::WriteResult(const std::string& path)
 {
     m_kWriteRecord.Clear();
     const bool written = WriteResultFile(m_kResultMotion, path, m_pkProfile->GetFrameRate(), m_kWriteRecord);
-    Report(path, m_kWriteRecord);
+    Notify(path, m_kWriteRecord);
     return written;
 }
 

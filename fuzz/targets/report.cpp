@@ -1,9 +1,9 @@
 // Lines of a run's report: failures and warnings must survive being written and read again.
 
 #include "CJsonWriter.h"
-#include "CReport.h"
 #include "FuzzTarget.h"
-#include "ReportJson.h"
+#include "Notice.h"
+#include "NoticeJson.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -14,7 +14,7 @@ namespace gw {
 
 namespace {
 
-std::string Written(const std::vector<CReport>& reports)
+std::string Written(const std::vector<Notice>& notices)
 {
     char* text = nullptr;
     size_t size = 0;
@@ -22,7 +22,7 @@ std::string Written(const std::vector<CReport>& reports)
     {
         CJsonWriter json(file);
         json.BeginObject();
-        WriteReports(json, reports);
+        WriteNotices(json, notices);
         json.EndObject();
     }
     std::fclose(file);
@@ -31,20 +31,20 @@ std::string Written(const std::vector<CReport>& reports)
     return written;
 }
 
-bool IsSame(const CReport& a, const CReport& b)
+bool IsSame(const Notice& a, const Notice& b)
 {
     return a.path == b.path && a.where == b.where && a.code == b.code && a.name == b.name &&
-           a.words == b.words && a.warning == b.warning;
+           a.words == b.words && a.severity == b.severity;
 }
 
 void CheckLine(std::string_view line)
 {
     std::string output, outcome;
-    std::vector<CReport> first, second;
-    const bool isLine = ReadReportLine(line, output, outcome) == EJsonFault::None;
-    const bool isObject = ReadReports(line, first);
+    std::vector<Notice> first, second;
+    const bool isLine = ReadReportLine(line, output, outcome) == EFailure::None;
+    const bool isObject = ReadNotices(line, first);
     Require(isObject || !isLine, "a line of a report is an object");
-    Require(ReadReports(Written(first), second), "what was written can be read");
+    Require(ReadNotices(Written(first), second), "what was written can be read");
     Require(std::ranges::equal(first, second, IsSame), "reports survive");
 }
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CObject.h"
 
 #include <span>

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CFactoryMap.h"
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CObject.h"
 #include "COrrinThumbnail.h"
 #include "CVersion.h"

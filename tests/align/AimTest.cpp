@@ -9,9 +9,9 @@
 #include "CRetargeter.h"
 #include "Directions.h"
 #include "MotionNode.h"
-#include "RestMisfits.h"
 #include "Rotations.h"
 #include "Skeleton.h"
+#include "TurnedBones.h"
 
 #include <gtest/gtest.h>
 #include <map>
@@ -154,7 +154,7 @@ TEST(AimBones, HangsLegsOnThePelvisHoweverTheSpineLeans)
     EXPECT_LT(Vec3Length(thigh - Vec3{95, -138, 0}), 0.1);
 }
 
-TEST(FindRestMisfits, NamesLimbsThatRowsTurnAtRest)
+TEST(FindTurnedBones, NamesLimbsThatRowsTurnAtRest)
 {
     const CMadeBody hanging = HangingArms();
     const CMadeBody straight{{}};
@@ -165,8 +165,8 @@ TEST(FindRestMisfits, NamesLimbsThatRowsTurnAtRest)
         for (const MadeBone& bone : kBones)
             table.SetOffsetAngles(&target.Bone(bone.name), spoil ? Vec3{0, 90, 0} : kVec3Zero);
         std::vector<std::string> found;
-        for (const RestMisfit& misfit : FindRestMisfits(table, target.Root()))
-            found.push_back(misfit.target);
+        for (const TurnedBone& bone : FindTurnedBones(table, target.Root()))
+            found.push_back(bone.target);
         return found;
     };
     EXPECT_EQ(names(straight, false), std::vector<std::string>());

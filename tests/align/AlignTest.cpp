@@ -119,13 +119,13 @@ CMadeBody Made(const TellingRow& row)
     return CMadeBody(telling);
 }
 
-AlignedMotion Align(const CMadeBody& body, AlignReport* report = nullptr)
+AlignedMotion Align(const CMadeBody& body, Corrections* corrections = nullptr)
 {
     const BodyMotion motion = body.Motion();
     Alignment alignment;
     EXPECT_TRUE(PlanAlignment(motion, alignment));
-    if (report)
-        *report = alignment.report;
+    if (corrections)
+        *corrections = alignment.corrections;
     return AlignMotion(motion, alignment);
 }
 
@@ -137,9 +137,9 @@ double LargestDistance(const std::vector<Mat4>& a, const std::vector<Mat4>& b)
     return largest;
 }
 
-size_t CountNeeds(const AlignReport& report, EAlignNeed need)
+size_t CountOf(const Corrections& corrections, ECorrection kind)
 {
-    return static_cast<size_t>(std::ranges::count(report.findings, need, &AlignFinding::need));
+    return static_cast<size_t>(std::ranges::count(corrections.list, kind, &Correction::kind));
 }
 
 TEST(AlignMotion, KeepsEveryJointWhereItIsAtEveryFrame)
@@ -240,8 +240,8 @@ TEST(AlignMotion, ChangesNothingOfWhatIsAligned)
         }
         Alignment alignment;
         ASSERT_TRUE(PlanAlignment(again, alignment));
-        EXPECT_TRUE(alignment.report.findings.empty());
-        EXPECT_EQ(alignment.report.referenceFrame, -1);
+        EXPECT_TRUE(alignment.corrections.list.empty());
+        EXPECT_EQ(alignment.corrections.referenceFrame, -1);
         for (const JointAlignment& joint : alignment.joints)
             EXPECT_LT(AngleOf(joint.turn), 0.1) << joint.node->GetName();
     }
@@ -253,9 +253,9 @@ TEST(AlignMotion, TellsPositionsThatRepeatOffsetsOnce)
     telling.doubled = true;
     const CMadeBody told(telling);
     const CMadeBody truth{Telling()};
-    AlignReport report;
-    const AlignedMotion aligned = Align(told, &report);
-    EXPECT_EQ(CountNeeds(report, EAlignNeed::DoubledPositions), told.Names().size() - 1);
+    Corrections corrections;
+    const AlignedMotion aligned = Align(told, &corrections);
+    EXPECT_EQ(CountOf(corrections, ECorrection::DoubledPositions), told.Names().size() - 1);
     EXPECT_LT(LargestDistance(WorldsAt(*aligned.root, told.Motion().frequency, 9),
                               WorldsAt(*truth.Motion().root, told.Motion().frequency, 9)),
               0.001);
@@ -326,15 +326,15 @@ TEST(CHingeMeter, FramesThatHardlyBendHaveNoSay)
 TEST(PlanAlignment, NamesWhatItMends)
 {
     const auto findings = [](const TellingRow& row) {
-        AlignReport report;
-        Align(Made(row), &report);
-        return report;
+        Corrections corrections;
+        Align(Made(row), &corrections);
+        return corrections;
     };
     const std::vector<TellingRow> rows = Tellings();
-    EXPECT_TRUE(findings(rows[0]).findings.empty()) << rows[0].what;
-    EXPECT_EQ(CountNeeds(findings(rows[1]), EAlignNeed::RestPose), 4u) << rows[1].what;
-    EXPECT_EQ(CountNeeds(findings(rows[4]), EAlignNeed::UpAxis), 1u) << rows[4].what;
-    EXPECT_EQ(CountNeeds(findings(rows[9]), EAlignNeed::BoneFrames), 4u) << rows[9].what;
+    EXPECT_TRUE(findings(rows[0]).list.empty()) << rows[0].what;
+    EXPECT_EQ(CountOf(findings(rows[1]), ECorrection::RestPose), 4u) << rows[1].what;
+    EXPECT_EQ(CountOf(findings(rows[4]), ECorrection::UpAxis), 1u) << rows[4].what;
+    EXPECT_EQ(CountOf(findings(rows[9]), ECorrection::BoneFrames), 4u) << rows[9].what;
     EXPECT_GE(findings(rows[7]).referenceFrame, 0) << rows[7].what;
 }
 
@@ -347,9 +347,9 @@ TEST(PlanAlignment, LeavesABodyThatLiesOnTheGroundLying)
     root.m_kRestMatrix.SetTranslation({0, 90, 0});
     for (Vec3& place : root.m_kPositionKeys.Expand())
         place = place + Vec3{150, 0, 220};
-    AlignReport report;
-    Align(told, &report);
-    EXPECT_EQ(CountNeeds(report, EAlignNeed::UpAxis), 0u);
+    Corrections corrections;
+    Align(told, &corrections);
+    EXPECT_EQ(CountOf(corrections, ECorrection::UpAxis), 0u);
 }
 
 TEST(PlanAlignment, RefusesWhatIsNoBody)

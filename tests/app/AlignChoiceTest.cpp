@@ -101,7 +101,7 @@ TEST_F(AlignTest, NeedsABody)
 TEST_F(AlignTest, WritesTheSourceAsAMotionThatOpensAgain)
 {
     OpenNecked();
-    CFileConversion conversion(m_kFolder.Path("data/"), {true, false}, [](const CReport&) {});
+    CFileConversion conversion(m_kFolder.Path("data/"), {true, false}, [](const Notice&) {});
     ASSERT_TRUE(conversion.LoadSource(m_kFolder.Path("walk.bvh")) && conversion.LoadTarget() &&
                 conversion.UseProfile(m_kFolder.Path("data/PoserBVH.prf")) &&
                 conversion.WriteAligned(m_kFolder.Path("a.bvh")));

@@ -4,7 +4,7 @@
 #include "TempFolder.h"
 
 #include "CResourceManager.h"
-#include "FailureWords.h"
+#include "FindingWords.h"
 #include "StringTable.h"
 
 #include <gtest/gtest.h>
@@ -124,23 +124,24 @@ TEST(StringTable, FormatsTakeNothingButTheirArguments)
         EXPECT_EQ(FormatText(format, arguments), text);
 }
 
-TEST(FailureWords, EveryReasonHasItsOwnCodeAndWords)
+TEST(FindingWords, EveryReasonHasItsOwnWordsAndEveryReadersItsOwnCode)
 {
     std::set<std::string> codes, words;
-    int count = 0;
-    for (int reason = 0; reason <= static_cast<int>(EFailure::CutName); ++reason, ++count)
+    constexpr auto kLast = static_cast<size_t>(EFailure::TurnedAtRest);
+    for (size_t reason = 0; reason <= kLast; ++reason)
     {
-        const CReport report = MakeReport("a.bvh", CFailure{static_cast<EFailure>(reason), 0, {}}, false);
-        codes.insert(report.code);
-        words.insert(report.words);
+        const Notice notice = MakeNotice("a.bvh", {static_cast<EFailure>(reason)});
+        if (IsOfReader(static_cast<EFailure>(reason)))
+            codes.insert(notice.code);
+        words.insert(notice.words);
     }
-    EXPECT_EQ(codes.size(), static_cast<size_t>(count));
-    EXPECT_EQ(words.size(), static_cast<size_t>(count));
+    EXPECT_EQ(codes.size(), static_cast<size_t>(EFailure::LfsPointer));
+    EXPECT_EQ(words.size(), kLast + 1);
 }
 
-TEST(FailureWords, AReportSaysWhereAndWhatToDo)
+TEST(FindingWords, ANoticeSaysWhereAndWhatToDo)
 {
-    const std::tuple<const char*, const char*, CFailure, const char*> rows[] = {
+    const std::tuple<const char*, const char*, Finding, const char*> rows[] = {
         {"a line",
          "a.bvh",
          {EFailure::BlankLine, 12, "Frames:"},
@@ -159,7 +160,7 @@ TEST(FailureWords, AReportSaysWhereAndWhatToDo)
          "a.htr: this is a folder or a device, not a file"},
     };
     for (const auto& [what, path, failure, line] : rows)
-        EXPECT_EQ(ReportLine(MakeReport(path, failure, false)), line) << what;
+        EXPECT_EQ(NoticeLine(MakeNotice(path, failure)), line) << what;
 }
 
 } // namespace gw

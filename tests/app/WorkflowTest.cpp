@@ -152,7 +152,7 @@ TEST_F(ContentTest, AContainerConverts)
     EXPECT_EQ(m_kContent.ConvertMotion(), 1);
     EXPECT_EQ(m_kContent.ResultMotion().GetLastFrame(), 1.0f);
 
-    CFileConversion alone(m_kFolder.Path("data/"), {}, [](const CReport&) {});
+    CFileConversion alone(m_kFolder.Path("data/"), {}, [](const Notice&) {});
     ASSERT_TRUE(alone.LoadSource(m_kFolder.Path("scene.orn")));
     EXPECT_TRUE(FindBoneMesh(*alone.SourceRoot())) << "without a window too: it tells how the bone points";
 }
@@ -265,8 +265,8 @@ TEST_F(ContentTest, WithoutATargetSkeletonTheSourceStillShows)
     EXPECT_EQ(Open(Write("walk.bvh", BvhText(kPoserBones))), 1);
     EXPECT_NE(m_kWindow.m_pkSource->m_spkShown, nullptr);
     EXPECT_FALSE(m_kWindow.m_kEnabled["convert"]);
-    ASSERT_FALSE(m_kWindow.m_kReports.empty());
-    EXPECT_EQ(m_kWindow.m_kReports.front().path, m_kFolder.Path("data/base.htr"));
+    ASSERT_FALSE(m_kWindow.m_kNotices.empty());
+    EXPECT_EQ(m_kWindow.m_kNotices.front().path, m_kFolder.Path("data/base.htr"));
 }
 
 TEST_F(ContentTest, ClosingAsksTheEditorFirst)

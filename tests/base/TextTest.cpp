@@ -1,6 +1,6 @@
 #include "Text.h"
 
-#include "CFailure.h"
+#include "CFailureRecord.h"
 
 #include <gmock/gmock.h>
 #include <gtest/gtest.h>

@@ -59,18 +59,18 @@ TEST(CheckBody, DoubtsMapsThatAreWrong)
     {
         const char* what;
         void (*spoil)(CBodyMap&);
-        EBodyDoubt doubt;
+        EDoubt doubt;
         EBodyJoint joint;
     } rows[] = {
-        {"left and right swapped", SwapAll, EBodyDoubt::SidesSwapped, EBodyJoint::Thigh},
-        {"arms swapped", [](CBodyMap& body) { std::swap(body.arms[0], body.arms[1]); },
-         EBodyDoubt::SidesSwapped, EBodyJoint::UpperArm},
-        {"clavicles as upper arms", MoveArmsInward, EBodyDoubt::ArmIsClavicle, EBodyJoint::UpperArm},
-        {"upper arms as clavicles", MoveArmsOutward, EBodyDoubt::ClavicleIsArm, EBodyJoint::UpperArm},
-        {"shins as thighs", MoveLegsOutward, EBodyDoubt::OddLength, EBodyJoint::Thigh},
+        {"left and right swapped", SwapAll, EDoubt::SidesSwapped, EBodyJoint::Thigh},
+        {"arms swapped", [](CBodyMap& body) { std::swap(body.arms[0], body.arms[1]); }, EDoubt::SidesSwapped,
+         EBodyJoint::UpperArm},
+        {"clavicles as upper arms", MoveArmsInward, EDoubt::ArmIsClavicle, EBodyJoint::UpperArm},
+        {"upper arms as clavicles", MoveArmsOutward, EDoubt::ClavicleIsArm, EBodyJoint::UpperArm},
+        {"shins as thighs", MoveLegsOutward, EDoubt::OddLength, EBodyJoint::Thigh},
         {"a hand that is the other one", [](CBodyMap& body) { body.arms[0].hand = body.arms[1].hand; },
-         EBodyDoubt::NotBelow, EBodyJoint::Hand},
-        {"arms as legs", TakeArmsForLegs, EBodyDoubt::NotBelow, EBodyJoint::Spine},
+         EDoubt::NotBelow, EBodyJoint::Hand},
+        {"arms as legs", TakeArmsForLegs, EDoubt::NotBelow, EBodyJoint::Spine},
     };
     for (const char* recipe : {"fingers", "fingers apose zup", "fingers nopose walk rightfirst"})
     {
@@ -110,7 +110,7 @@ TEST(CheckBody, LegsGoAwayFromTheHead)
     }
     const auto legsUp = [&] {
         const std::vector<BodyDoubt> doubts = CheckBody(body);
-        return std::ranges::count(doubts, EBodyDoubt::LegsUp, &BodyDoubt::kind);
+        return std::ranges::count(doubts, EDoubt::LegsUp, &BodyDoubt::kind);
     };
     EXPECT_EQ(legsUp(), 2);
     for (const BodyLeg& leg : body.legs)

@@ -29,7 +29,7 @@ void ExpectConsistent(const std::string& text)
     const bool loads = motion.Load(examined.Path());
     EXPECT_EQ(loads, examined.Exam().Facts().has_value());
     EXPECT_TRUE(loads || findings.HasErrors());
-    for (const CFailure& warning : motion.Record().Warnings())
+    for (const Finding& warning : motion.Record().Warnings())
         EXPECT_TRUE(findings.HasFaults() || warning.reason == EFailure::RestPose);
     if (!findings.MendsAny())
         return;
@@ -76,11 +76,11 @@ TEST(DamagedFiles, WithBytesChangedAreAnswered)
 TEST(DamagedFiles, ThatHoldNoMotionAreTold)
 {
     const std::tuple<const char*, std::string, const char*> rows[] = {
-        {"nothing", "", "0 reader"},
-        {"another text", "solid cube\nfacet\n", "2 reader"},
+        {"nothing", "", "0 missing-section"},
+        {"another text", "solid cube\nfacet\n", "2 missing-section"},
         {"bytes", std::string(300, '\x01'), "0 not-text"},
-        {"a motion without hierarchy", "MOTION\nFrames: 1\n0 0 0\n", "1 reader"},
-        {"a hierarchy without joints", "HIERARCHY\nMOTION\nFrames: 1\n", "2 reader"},
+        {"a motion without hierarchy", "MOTION\nFrames: 1\n0 0 0\n", "1 no-root"},
+        {"a hierarchy without joints", "HIERARCHY\nMOTION\nFrames: 1\n", "2 no-root"},
     };
     for (const auto& [what, text, found] : rows)
     {

@@ -1,6 +1,7 @@
 #include "Examined.h"
 
 #include "CMotionFile.h"
+#include "FindingWords.h"
 
 #include <gtest/gtest.h>
 
@@ -18,7 +19,7 @@ std::string CExamined::Found() const
     for (const Finding& finding : m_kExam.Findings().Sorted())
     {
         found += found.empty() ? "" : ", ";
-        found += std::to_string(finding.where) + ' ' + std::string(RowOf(finding.fault).code);
+        found += std::to_string(finding.where) + ' ' + std::string(FindingCode(finding));
     }
     return found;
 }

@@ -85,7 +85,7 @@ TEST_F(Choose, AHandThatWouldStandAcrossIsTold)
     const std::vector<ProfileChoice> choices = Of(body.Root(), {std::string(kAssets) + "HumanIK02.prf"});
     std::vector<std::string> turned;
     for (const ProfileDoubt& doubt : choices.front().verdict.doubts)
-        turned.emplace_back(doubt.kind == EProfileDoubt::Turned ? doubt.joint : "another doubt");
+        turned.emplace_back(doubt.kind == EDoubt::Turned ? doubt.joint : "another doubt");
     EXPECT_THAT(turned, testing::ElementsAre("LeftHand", "RightHand"));
     EXPECT_EQ(choices.front().verdict.sureness, ESureness::Likely);
 }

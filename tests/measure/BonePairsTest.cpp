@@ -29,19 +29,19 @@ TEST(BonePairs, ProfileRowsBecomePairsAndMisfits)
                      "rcalf <---> RCalf 0,90,0,1,2,3\n"
                      "Head <---> Head 0,0,0,1,2,3\n");
     std::vector<BonePair> pairs;
-    std::vector<PairMisfit> misfits;
-    ASSERT_TRUE(ReadBonePairs(path, root, root, pairs, misfits));
+    std::vector<MissingBone> missing;
+    ASSERT_TRUE(ReadBonePairs(path, root, root, pairs, missing));
 
     ASSERT_EQ(pairs.size(), 3u);
     EXPECT_EQ(PairText(pairs[0]), "LowerTorso>LowerTorso");
     EXPECT_EQ(PairText(pairs[1]), "Head>Head") << "the later row counts";
     EXPECT_EQ(PairText(pairs[2]), "RCalf>RCalf");
-    ASSERT_EQ(misfits.size(), 1u);
-    EXPECT_EQ(misfits[0].line, 7u);
-    EXPECT_EQ(misfits[0].source, "Tail");
-    EXPECT_TRUE(misfits[0].targetFound && !misfits[0].sourceFound);
+    ASSERT_EQ(missing.size(), 1u);
+    EXPECT_EQ(missing[0].line, 7u);
+    EXPECT_EQ(missing[0].name, "Tail");
+    EXPECT_EQ(missing[0].side, ESkeletonSide::Source);
 
-    EXPECT_FALSE(ReadBonePairs(folder.Path("gone.prf"), root, root, pairs, misfits));
+    EXPECT_FALSE(ReadBonePairs(folder.Path("gone.prf"), root, root, pairs, missing));
     EXPECT_EQ(pairs.size(), 3u) << "a profile that is gone changes nothing";
 }
 

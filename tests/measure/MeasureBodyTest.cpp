@@ -1,7 +1,7 @@
 // Hips, trunk, legs' jitter and hands of made clips, all within 1 % of what was put in.
 
 #include "Angles.h"
-#include "CMadeFigure.h"
+#include "PairedFigures.h"
 
 #include <cmath>
 #include <gtest/gtest.h>

@@ -46,7 +46,7 @@ const struct
     {EFailure::Truncated, "Truncated"},
 };
 
-std::string FailureText(const CFailure& failure)
+std::string FailureText(const Finding& failure)
 {
     const auto row =
         std::ranges::find_if(kReasons, [&](const auto& r) { return r.reason == failure.reason; });
@@ -84,7 +84,7 @@ std::string TreeText(CNode* root)
 std::string RecordText(const CFailureRecord& record)
 {
     std::string text = record.Failure() ? "failed " + FailureText(record.Failure()) : "";
-    for (const CFailure& warning : record.Warnings())
+    for (const Finding& warning : record.Warnings())
         text += FailureText(warning);
     return text;
 }

@@ -3,11 +3,11 @@
 #include "CBatchRun.h"
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
+#include "CShellNotices.h"
 #include "CommandTable.h"
+#include "NoticeJson.h"
 #include "Output.h"
 #include "Paths.h"
-#include "ReportJson.h"
 #include "RunSetup.h"
 #include "SourceList.h"
 #include "Text.h"
@@ -29,14 +29,14 @@ bool SelectProfile(const ShellOptions& options, CShellConversion& conversion, co
     return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
 }
 
-void WriteJson(const ShellOptions& options, const std::vector<CReport>& reports, size_t finished)
+void WriteJson(const ShellOptions& options, const std::vector<Notice>& notices, size_t finished)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
     json.Key("folder").Text(options.files.empty() ? std::string() : options.files[0]);
     json.Key("job").Text(options.job);
     json.Key("finished").Integer(static_cast<int64_t>(finished));
-    WriteReports(json, reports);
+    WriteNotices(json, notices);
     json.EndObject();
     json.EndDocument();
 }
@@ -52,16 +52,16 @@ size_t FinishedCount(const ShellOptions& options, const CBatchRun& run, bool fai
 
 EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
 {
-    CShellReports ownReports(options);
-    CShellConversion conversion(options, {}, ownReports);
-    CBatchRun run(options, jobs, StateOf(options), conversion, ownReports);
+    CShellNotices ownNotices(options);
+    CShellConversion conversion(options, {}, ownNotices);
+    CBatchRun run(options, jobs, StateOf(options), conversion, ownNotices);
     const bool begins = SelectProfile(options, conversion, jobs.front().source);
     const EExit exit = begins ? run.RunAll() : EExit::Failed;
-    std::vector<CReport> reports = ownReports.All();
-    reports.insert(reports.end(), run.Reports().begin(), run.Reports().end());
-    const bool failed = exit == EExit::Failed || !std::ranges::all_of(reports, &CReport::warning);
+    std::vector<Notice> notices = ownNotices.All();
+    notices.insert(notices.end(), run.Notices().begin(), run.Notices().end());
+    const bool failed = exit == EExit::Failed || !std::ranges::all_of(notices, &Notice::IsWarning);
     if (options.json)
-        WriteJson(options, reports, FinishedCount(options, run, failed));
+        WriteJson(options, notices, FinishedCount(options, run, failed));
     return exit == EExit::Done && failed ? EExit::Failed : exit;
 }
 

@@ -6,10 +6,10 @@
 #include "CPagePart.h"
 #include "CSceneFile.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
+#include "CShellNotices.h"
 #include "CheckResult.h"
 #include "CommandTable.h"
-#include "CompareReport.h"
+#include "CompareText.h"
 #include "ConvertedMotion.h"
 #include "PackagedMotion.h"
 #include "PageOutput.h"
@@ -39,7 +39,7 @@ class CComparedSource
 {
 public:
     explicit CComparedSource(const ShellOptions& options)
-        : options_(options), m_kReports(options), m_kConversion(options, {true, false}, m_kReports)
+        : options_(options), m_kNotices(options), m_kConversion(options, {true, false}, m_kNotices)
     {
     }
 
@@ -52,7 +52,7 @@ private:
     bool LoadFile();
 
     const ShellOptions& options_;
-    CShellReports m_kReports;
+    CShellNotices m_kNotices;
     CShellConversion m_kConversion;
     CSceneFile m_kFile;
 };
@@ -87,17 +87,17 @@ MotionClip CComparedSource::Clip()
 
 bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vector<BonePair>& pairs)
 {
-    std::vector<PairMisfit> misfits;
-    if (!ReadBonePairs(profilePath, source, result, pairs, misfits))
+    std::vector<MissingBone> missing;
+    if (!ReadBonePairs(profilePath, source, result, pairs, missing))
     {
         SayError(Printable(profilePath) + ": the profile cannot be read");
         return false;
     }
-    for (const PairMisfit& misfit : misfits)
-        SayError(Printable(profilePath) + ':' + std::to_string(misfit.line) + ": " +
-                 (misfit.sourceFound ? "the result has no bone " + Quoted(misfit.target)
-                                     : "the source has no bone " + Quoted(misfit.source)));
-    return misfits.empty();
+    for (const MissingBone& bone : missing)
+        SayError(Printable(profilePath) + ':' + std::to_string(bone.line) + ": the " +
+                 (bone.side == ESkeletonSide::Source ? "source" : "result") + " has no bone " +
+                 Quoted(bone.name));
+    return missing.empty();
 }
 
 bool WriteComparison(const ShellOptions& options, const std::string& profilePath, const MotionClip& source,

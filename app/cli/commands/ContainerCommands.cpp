@@ -73,7 +73,7 @@ EExit RunPackage(const ShellOptions& options)
         return EExit::Failed;
     CFailureRecord record;
     PackageMotion(source, output, options.rate, kPackageSixty, record);
-    if (const CFailure& failure = record.Failure())
+    if (const Finding& failure = record.Failure())
         return Fail(failure.name.empty() ? output : failure.name, failure.reason);
     return TellWritten(options, source, output);
 }

@@ -58,7 +58,7 @@ void Print(const ShellOptions& options, const std::string& path, const CFileExam
         PrintLine(Printable(path) + ": intact; a container has no poses to check");
     if (!exam.Facts())
         return;
-    const bool mixed = exam.Findings().Has(EFault::MixedChannels);
+    const bool mixed = exam.Findings().Has(EFailure::MixedChannels);
     PrintLine(Printable(path) + ": " + FactsLine(*exam.Facts()) + (mixed ? ", rotation orders: mixed" : ""));
 }
 

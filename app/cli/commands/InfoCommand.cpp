@@ -6,9 +6,9 @@
 #include "CSceneFile.h"
 #include "CommandTable.h"
 #include "InfoContainer.h"
+#include "NoticeJson.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
-#include "ReportJson.h"
 #include "Text.h"
 #include "Words.h"
 

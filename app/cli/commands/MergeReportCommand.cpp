@@ -2,13 +2,12 @@
 // of the reports does not matter, and a source reported twice counts with its last line.
 
 #include "CMappedFile.h"
-#include "CReport.h"
 #include "CSafeFile.h"
 #include "CommandTable.h"
-#include "FailureWords.h"
+#include "Notice.h"
+#include "NoticeJson.h"
 #include "Output.h"
 #include "PlanFile.h"
-#include "ReportJson.h"
 #include "RunTally.h"
 #include "Text.h"
 #include "Words.h"
@@ -22,26 +21,26 @@ namespace gw {
 namespace {
 
 /// The last report line for an output.
-struct ReportLineOf
+struct RunLine
 {
     std::string text;
     EConversion outcome = EConversion::Failed;
 };
 
-using Lines = std::unordered_map<std::string, ReportLineOf>; // keyed by output
+using Lines = std::unordered_map<std::string, RunLine>; // keyed by output
 
 // A line truncated by a killed run is skipped, and one nested too deeply was not written by a run.
 bool TakeLine(std::string_view text, Lines& lines)
 {
     std::string output;
     std::string outcome;
-    const EJsonFault fault = ReadReportLine(text, output, outcome);
+    const EFailure failure = ReadReportLine(text, output, outcome);
     for (const EConversion end : {EConversion::Converted, EConversion::Skipped, EConversion::Failed})
     {
-        if (fault == EJsonFault::None && outcome == OutcomeName(end))
+        if (failure == EFailure::None && outcome == OutcomeName(end))
             lines[output] = {std::string(text), end};
     }
-    return fault != EJsonFault::TooDeep;
+    return failure != EFailure::TooDeep;
 }
 
 bool ReadReport(const std::string& path, Lines& lines)
@@ -79,10 +78,10 @@ bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines
 
 void SayFailures(const ShellOptions& options, const std::string& line)
 {
-    std::vector<CReport> reports;
-    ReadReports(line, reports);
-    for (const CReport& report : reports)
-        SayReport(options, report);
+    std::vector<Notice> notices;
+    ReadNotices(line, notices);
+    for (const Notice& notice : notices)
+        SayNotice(options, notice);
 }
 
 // Sorts the lines in plan order and counts their results.

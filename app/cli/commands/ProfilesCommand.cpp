@@ -2,7 +2,7 @@
 
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
+#include "CShellNotices.h"
 #include "CommandTable.h"
 #include "DoubtWords.h"
 #include "FitWords.h"
@@ -109,8 +109,8 @@ void WriteJson(const std::vector<Entry>& entries)
 
 EExit RunProfiles(const ShellOptions& options)
 {
-    CShellReports reports(options);
-    CShellConversion conversion(options, {}, reports);
+    CShellNotices notices(options);
+    CShellConversion conversion(options, {}, notices);
     const bool hasSource = !options.files.empty();
     if (hasSource && !conversion.Open(options.files[0]))
         return EExit::Failed;

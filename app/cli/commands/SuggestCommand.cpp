@@ -3,10 +3,11 @@
 
 #include "CFileConversion.h"
 #include "CJsonWriter.h"
-#include "CReport.h"
 #include "CSafeFile.h"
-#include "CShellReports.h"
+#include "CShellNotices.h"
 #include "CommandTable.h"
+#include "DoubtWords.h"
+#include "Notice.h"
 #include "Output.h"
 #include "Paths.h"
 #include "ProfileFile.h"
@@ -33,14 +34,6 @@ constexpr const char* kEvidenceWords[] = {
     "by name and shape",
 };
 constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
-
-constexpr const char* kDoubtWords[] = {
-    "it is not below the expected parent joint", "left and right may be swapped",
-    "the joint before may be the upper arm",     "it may be the clavicle",
-    "the legs point up like the trunk",          "its bones are out of proportion",
-};
-constexpr const char* kDoubtCodes[] = {"not-below",       "sides-swapped", "clavicle-is-arm",
-                                       "arm-is-clavicle", "legs-up",       "odd-length"};
 
 constexpr const char* kKindCodes[] = {"turned", "neutral", "fixed", "no-source", "no-name"};
 
@@ -74,8 +67,8 @@ std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
     }
     std::string reason =
         std::string(Text(kSurenessWords, row.sureness)) + ": " + Text(kEvidenceWords, row.evidence);
-    for (const EBodyDoubt doubt : row.doubts)
-        reason += std::string("; ") + Text(kDoubtWords, doubt);
+    for (const EDoubt doubt : row.doubts)
+        reason += std::string("; ") + DoubtPhrase(doubt);
     if (row.nudged)
         reason += "; rotated slightly around its own axis, so that the bone below can follow";
     if (!profile.sidesAreSure && HasSides(row.place.joint))
@@ -121,8 +114,8 @@ void WriteRow(CJsonWriter& json, const SuggestedRow& row)
         json.Key("sureness").Text(Text(kSurenessWords, row.sureness));
         json.Key("evidence").Text(Text(kEvidenceCodes, row.evidence));
         json.Key("doubts").BeginArray();
-        for (const EBodyDoubt doubt : row.doubts)
-            json.Text(Text(kDoubtCodes, doubt));
+        for (const EDoubt doubt : row.doubts)
+            json.Text(DoubtCode(doubt));
         json.EndArray();
         json.Key("restError");
         if (row.restError)
@@ -172,7 +165,7 @@ bool WriteProfile(const std::string& path, const std::string& text)
     CSafeFile file;
     if (file.Open(path) && file.Write(text) && file.Commit())
         return true;
-    SayFailure(path, {EFailure::WriteError, 0, {}});
+    SayFailure(path, {EFailure::WriteError});
     return false;
 }
 
@@ -181,13 +174,11 @@ void WarnOfRate(const ShellOptions& options, int sourceRate, int profileRate)
 {
     if (sourceRate == profileRate)
         return;
-    CReport report = ShellFailure(options.output, "rate",
-                                  "the source has " + std::to_string(sourceRate) +
-                                      " frames per second, but the nearest rate that a profile can have is " +
-                                      std::to_string(profileRate) + ", so results will play " +
-                                      (sourceRate < profileRate ? "faster" : "slower"));
-    report.warning = true;
-    SayReport(options, report);
+    const std::string words = "the source has " + std::to_string(sourceRate) +
+                              " frames per second, but the nearest rate that a profile can have is " +
+                              std::to_string(profileRate) + ", so results will play " +
+                              (sourceRate < profileRate ? "faster" : "slower");
+    SayNotice(options, MakeNotice(options.output, "rate", words, ESeverity::Warning));
 }
 
 // Writes the profile and prints its rows.
@@ -223,9 +214,9 @@ EExit RunSuggest(const ShellOptions& options)
     }
     if (!MayWrite(options, options.output))
         return EExit::Failed;
-    CShellReports reports(options);
-    CFileConversion conversion(options.dataFolder, {}, [&](const CReport& report) { reports.Add(report); });
-    if (!conversion.LoadSource(options.files[0]) || !conversion.LoadTarget() || reports.HasFailed())
+    CShellNotices notices(options);
+    CFileConversion conversion(options.dataFolder, {}, [&](const Notice& notice) { notices.Add(notice); });
+    if (!conversion.LoadSource(options.files[0]) || !conversion.LoadTarget() || notices.HasFailed())
         return EExit::Failed;
     const SuggestedProfile profile =
         SuggestProfile(*conversion.SourceRoot(), *conversion.Result().motionRoot);

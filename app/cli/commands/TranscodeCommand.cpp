@@ -1,6 +1,6 @@
 #include "CMotionFile.h"
-#include "CReport.h"
 #include "CommandTable.h"
+#include "Notice.h"
 #include "Output.h"
 #include "Paths.h"
 #include "TKBVHStream.h"
@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-EExit Fail(const std::string& path, const CFailure& failure)
+EExit Fail(const std::string& path, const Finding& failure)
 {
     SayFailure(path, failure);
     return EExit::Failed;
@@ -70,7 +70,7 @@ EExit RunTranscode(const ShellOptions& options)
     }
     if (const char* const words = WhyNoBVH(motion))
     {
-        SayReport(options, ShellFailure(source, "no-bvh", words));
+        SayNotice(options, MakeNotice(source, "no-bvh", words));
         return EExit::Failed;
     }
     TKBVHStream stream(motion);

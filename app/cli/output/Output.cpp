@@ -24,9 +24,9 @@ bool IsTaken(const std::string& path)
     return FileExists(path) || FolderExists(path) || IsLink(path);
 }
 
-CReport UnreadableFolder(const std::string& path)
+Notice UnreadableFolder(const std::string& path)
 {
-    return ShellFailure(path, "unreadable-folder", "the folder cannot be read (check its permissions)");
+    return MakeNotice(path, "unreadable-folder", "the folder cannot be read (check its permissions)");
 }
 
 bool CanListFolder(const ShellOptions& options, const std::string& path)
@@ -34,7 +34,7 @@ bool CanListFolder(const ShellOptions& options, const std::string& path)
     std::error_code error;
     const std::filesystem::directory_iterator entries(path, error);
     if (error)
-        SayReport(options, UnreadableFolder(path));
+        SayNotice(options, UnreadableFolder(path));
     return !error;
 }
 
@@ -44,26 +44,26 @@ bool IsSameFile(const std::string& a, const std::string& b)
     return std::filesystem::equivalent(a, b, error);
 }
 
-std::optional<CReport> WhyNotWrite(const ShellOptions& options, const std::string& path)
+std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path)
 {
     if (FolderExists(path))
-        return ShellFailure(path, "folder", "this is a folder; name the file to write");
+        return MakeNotice(path, "folder", "this is a folder; name the file to write");
     if (options.force)
         return std::nullopt;
     if (FileExists(path))
-        return ShellFailure(path, "exists", "the file exists; --force replaces it");
+        return MakeNotice(path, "exists", "the file exists; --force replaces it");
     if (IsLink(path))
-        return ShellFailure(path, "dangling-link",
-                            "this is a link to a file that does not exist; --force writes that file");
+        return MakeNotice(path, "dangling-link",
+                          "this is a link to a file that does not exist; --force writes that file");
     CSafeFile::KeepExisting(path);
     return std::nullopt;
 }
 
 bool MayWrite(const ShellOptions& options, const std::string& path)
 {
-    const std::optional<CReport> refusal = WhyNotWrite(options, path);
+    const std::optional<Notice> refusal = WhyNotWrite(options, path);
     if (refusal)
-        SayReport(options, *refusal);
+        SayNotice(options, *refusal);
     return !refusal;
 }
 

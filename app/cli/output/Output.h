@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CReport.h"
+#include "Notice.h"
 #include "ShellOptions.h"
 
 #include <optional>
@@ -14,14 +14,14 @@ bool IsDecidedOnExisting(const ShellOptions& options);
 /// Returns whether anything exists at a path, including a dangling link.
 bool IsTaken(const std::string& path);
 /// Returns the failure for a folder whose files cannot be listed.
-CReport UnreadableFolder(const std::string& path);
+Notice UnreadableFolder(const std::string& path);
 /// Returns whether the files of a folder can be listed; prints an error if not.
 bool CanListFolder(const ShellOptions& options, const std::string& path);
 /// Returns whether two paths refer to the same existing file.
 bool IsSameFile(const std::string& a, const std::string& b);
 /// Returns why a command must not write a file: it exists and --force is missing, or it is a folder. Without
 /// --force, saving to a writable path also fails if a file appears there first.
-std::optional<CReport> WhyNotWrite(const ShellOptions& options, const std::string& path);
+std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path);
 /// Returns whether a command may write a file; prints an error if not.
 bool MayWrite(const ShellOptions& options, const std::string& path);
 /// Prints which source was written to which output. Returns Done.

@@ -1,8 +1,8 @@
 #include "Words.h"
 
-#include "CFailure.h"
-#include "CReport.h"
-#include "FailureWords.h"
+#include "CFailureRecord.h"
+#include "FindingWords.h"
+#include "Notice.h"
 #include "ShellOptions.h"
 #include "Text.h"
 
@@ -29,38 +29,29 @@ void SayWord(const ShellOptions& options, std::string_view words)
         SayError(words);
 }
 
-void SayReport(const ShellOptions& options, const CReport& report)
+void SayNotice(const ShellOptions& options, const Notice& notice)
 {
-    if (report.warning)
-        SayWord(options, "warning: " + ReportLine(report));
+    if (notice.IsWarning())
+        SayWord(options, "warning: " + NoticeLine(notice));
     else
-        SayError(ReportLine(report));
+        SayError(NoticeLine(notice));
 }
 
-CReport ShellFailure(const std::string& path, const char* code, const std::string& words)
+void SayFailure(const std::string& path, const Finding& failure)
 {
-    CReport report;
-    report.path = path;
-    report.code = code;
-    report.words = words;
-    return report;
-}
-
-void SayFailure(const std::string& path, const CFailure& failure)
-{
-    SayError(ReportLine(MakeReport(path, failure, false)));
+    SayError(NoticeLine(MakeNotice(path, failure)));
 }
 
 void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record)
 {
-    for (const CFailure& warning : record.Warnings())
-        SayReport(options, MakeReport(path, warning, true));
+    for (const Finding& warning : record.Warnings())
+        SayNotice(options, MakeNotice(path, warning));
 }
 
-void SayDamage(const std::string& path, const CFailure& failure)
+void SayDamage(const std::string& path, const Finding& failure)
 {
     const std::string place = failure.where == 0 ? "" : " at byte " + std::to_string(failure.where);
-    SayError(Printable(path) + ": damaged" + place + ": " + MakeReport(path, failure, false).words);
+    SayError(Printable(path) + ": damaged" + place + ": " + MakeNotice(path, failure).words);
 }
 
 } // namespace gw

@@ -1,14 +1,14 @@
 #pragma once
 
+#include "Notice.h"
+
 #include <string>
 #include <string_view>
 
 namespace gw {
 
 class CFailureRecord;
-struct CFailure;
 struct ShellOptions;
-struct CReport;
 
 /// Prints a line to standard error after the program's name. Names from files must already be printable.
 void SayError(std::string_view words);
@@ -17,15 +17,13 @@ bool Refuse(std::string_view words);
 /// Same for information that is not a failure; silent with --quiet.
 void SayWord(const ShellOptions& options, std::string_view words);
 /// Prints a failure, or a warning unless --quiet.
-void SayReport(const ShellOptions& options, const CReport& report);
-/// Returns a failure that only occurs in the shell. The code is a short fixed word for programs.
-CReport ShellFailure(const std::string& path, const char* code, const std::string& words);
+void SayNotice(const ShellOptions& options, const Notice& notice);
 /// Prints the failure recorded by a file's reader or writer.
-void SayFailure(const std::string& path, const CFailure& failure);
+void SayFailure(const std::string& path, const Finding& failure);
 /// Prints all recorded warnings.
 void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record);
 
 /// Prints what stopped the reading of a container: "scene.orn: damaged at byte 381: ...".
-void SayDamage(const std::string& path, const CFailure& failure);
+void SayDamage(const std::string& path, const Finding& failure);
 
 } // namespace gw

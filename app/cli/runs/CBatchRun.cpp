@@ -5,8 +5,8 @@
 #include "CContentHash.h"
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
-#include "ReportJson.h"
+#include "CShellNotices.h"
+#include "NoticeJson.h"
 #include "StringTable.h"
 #include "Text.h"
 #include "Words.h"
@@ -21,8 +21,8 @@ EBatchJob BatchJobOf(const ShellOptions& options)
 }
 
 CBatchRun::CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
-                     CShellReports& reports)
-    : CFileRun(options, std::move(jobs), std::move(state)), conversion_(conversion), ownReports_(reports)
+                     CShellNotices& notices)
+    : CFileRun(options, std::move(jobs), std::move(state)), conversion_(conversion), ownNotices_(notices)
 {
 }
 
@@ -45,7 +45,7 @@ EBatchStep CBatchRun::RunJob(const ConversionJob& job)
         return ConvertMotion(job);
     CFailureRecord record;
     const bool packaged = PackageMotionFile(job.source, job.output, record);
-    conversion_.Report(job.source, record);
+    conversion_.Notify(job.source, record);
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 
@@ -56,17 +56,17 @@ CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, 
     const ConversionJob& job = AllJobs()[index];
     SayWord(Options(), Printable(job.source) + " (" + std::to_string(index + 1) + " of " +
                            std::to_string(AllJobs().size()) + ')');
-    const size_t before = ownReports_.All().size();
+    const size_t before = ownNotices_.All().size();
     const EBatchStep step = RunJob(job);
-    const auto reports = std::span(ownReports_.All()).subspan(before);
-    const bool good = step == EBatchStep::Done && std::ranges::all_of(reports, &CReport::warning);
+    const auto notices = std::span(ownNotices_.All()).subspan(before);
+    const bool good = step == EBatchStep::Done && std::ranges::all_of(notices, &Notice::IsWarning);
     const EConversion outcome = good ? EConversion::Converted : EConversion::Failed;
-    WriteRecord(index, outcome, reports, record);
+    WriteRecord(index, outcome, notices, record);
     const bool endsRun = step != EBatchStep::Done && !options.keepGoing;
     return {outcome, endsRun, endsRun && step == EBatchStep::Abandoned};
 }
 
-void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports,
+void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const Notice> notices,
                             std::FILE* record)
 {
     const bool converts = BatchJobOf(Options()) == EBatchJob::ToMotion;
@@ -78,14 +78,14 @@ void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const C
     json.Key("profile").Text(converts ? conversion_.Profile().name : "");
     json.Key("profilePath").Text(converts ? conversion_.ProfilePath() : "");
     json.Key("frames").Integer(converts ? conversion_.Result().GetKeyCount() : 0);
-    WriteReports(json, {reports.begin(), reports.end()});
+    WriteNotices(json, {notices.begin(), notices.end()});
     json.EndObject();
     json.EndDocument();
 }
 
-void CBatchRun::TellLost(size_t index, const CReport& reason, std::FILE* record)
+void CBatchRun::TellLost(size_t index, const Notice& reason, std::FILE* record)
 {
-    SayReport(Options(), reason);
+    SayNotice(Options(), reason);
     WriteRecord(index, EConversion::Failed, {&reason, 1}, record);
 }
 
@@ -106,7 +106,7 @@ bool CBatchRun::AddProfiles(CContentHash& key)
 void CBatchRun::TakeRecord(size_t, EConversion, std::string_view record, std::string_view)
 {
     ++m_uiTaken;
-    ReadReports(record, m_kReports);
+    ReadNotices(record, m_kNotices);
 }
 
 bool CBatchRun::TellEnd()

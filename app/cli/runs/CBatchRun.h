@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CFileRun.h"
-#include "CReport.h"
+#include "Notice.h"
 #include "ResultFile.h"
 
 #include <span>
@@ -9,25 +9,25 @@
 namespace gw {
 
 class CShellConversion;
-class CShellReports;
+class CShellNotices;
 
 /// The desktop program's batch run: one profile for all files, chosen before it begins, with its own
 /// messages. Every worker inherits the conversion in the state at its start.
 class CBatchRun : public CFileRun
 {
 public:
-    /// Conversion, reports and options must outlive the run.
+    /// Conversion, notices and options must outlive the run.
     CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
-              CShellReports& reports);
+              CShellNotices& notices);
 
-    /// Returns all reports about the files, in order.
-    const std::vector<CReport>& Reports() const { return m_kReports; }
+    /// Returns all notices about the files, in order.
+    const std::vector<Notice>& Notices() const { return m_kNotices; }
     /// Returns the number of files that were started.
     size_t TakenCount() const { return m_uiTaken; }
 
 protected:
     FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) override;
-    void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
+    void TellLost(size_t index, const Notice& reason, std::FILE* record) override;
     void TellUpToDate(size_t index) override;
     bool AddProfiles(CContentHash& key) override;
     void TakeRecord(size_t index, EConversion outcome, std::string_view record,
@@ -37,11 +37,11 @@ protected:
 private:
     EBatchStep RunJob(const ConversionJob& job);
     EBatchStep ConvertMotion(const ConversionJob& job);
-    void WriteRecord(size_t index, EConversion outcome, std::span<const CReport> reports, std::FILE* record);
+    void WriteRecord(size_t index, EConversion outcome, std::span<const Notice> notices, std::FILE* record);
 
     CShellConversion& conversion_;
-    CShellReports& ownReports_; ///< of this process
-    std::vector<CReport> m_kReports;
+    CShellNotices& ownNotices_; ///< of this process
+    std::vector<Notice> m_kNotices;
     size_t m_uiTaken = 0;
 };
 

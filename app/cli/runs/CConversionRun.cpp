@@ -2,9 +2,9 @@
 
 #include "CContentHash.h"
 #include "CPagePart.h"
-#include "CReport.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
+#include "CShellNotices.h"
+#include "Notice.h"
 #include "PageOutput.h"
 
 #include <utility>
@@ -29,7 +29,7 @@ CFileRun::FileEnd CConversionRun::Convert(const ShellOptions& options, size_t in
     return {.outcome = outcome, .endsRun = outcome == EConversion::Failed && !options.keepGoing};
 }
 
-void CConversionRun::TellLost(size_t index, const CReport& reason, std::FILE* record)
+void CConversionRun::TellLost(size_t index, const Notice& reason, std::FILE* record)
 {
     TellFailed(Options(), AllJobs()[index], reason, record);
 }
@@ -42,8 +42,8 @@ void CConversionRun::TellUpToDate(size_t index)
 // The requested profile, or all those that each source chooses from.
 bool CConversionRun::AddProfiles(CContentHash& key)
 {
-    CShellReports reports(Options());
-    CShellConversion conversion(Options(), {}, reports);
+    CShellNotices notices(Options());
+    CShellConversion conversion(Options(), {}, notices);
     if (!Options().profile.empty())
     {
         const std::string path = conversion.ResolveProfile(Options().profile);

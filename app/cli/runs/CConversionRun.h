@@ -13,7 +13,7 @@ public:
 
 protected:
     FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) override;
-    void TellLost(size_t index, const CReport& reason, std::FILE* record) override;
+    void TellLost(size_t index, const Notice& reason, std::FILE* record) override;
     void TellUpToDate(size_t index) override;
     bool AddProfiles(CContentHash& key) override;
     std::string Enclosure() override;

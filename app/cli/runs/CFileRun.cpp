@@ -8,11 +8,11 @@
 #include "CContentHash.h"
 #include "CFilePlatform.h"
 #include "CJsonWriter.h"
-#include "CReport.h"
 #include "CSafeFile.h"
 #include "CTextFile.h"
 #include "CWorkerPool.h"
 #include "CommandTable.h"
+#include "Notice.h"
 #include "OptionJson.h"
 #include "Output.h"
 #include "Paths.h"
@@ -67,20 +67,20 @@ std::string Timed(std::string record, double seconds)
     return record + ",\"seconds\":" + std::string(&digits[0], end);
 }
 
-CReport LostReport(const ConversionJob& job, const JobEnd& end, float limit)
+Notice LostNotice(const ConversionJob& job, const JobEnd& end, float limit)
 {
     if (end.kind == JobEnd::EKind::TimedOut)
-        return ShellFailure(job.source, "time-limit",
-                            "not done within " + std::to_string(static_cast<int64_t>(limit)) +
-                                " seconds, so it was stopped; use --time-limit to allow more");
+        return MakeNotice(job.source, "time-limit",
+                          "not done within " + std::to_string(static_cast<int64_t>(limit)) +
+                              " seconds, so it was stopped; use --time-limit to allow more");
     if (end.kind == JobEnd::EKind::Ran)
-        return ShellFailure(job.source, "no-record",
-                            "the messages about it cannot be stored (is there a limit on the size of "
-                            "files?)");
+        return MakeNotice(job.source, "no-record",
+                          "the messages about it cannot be stored (is there a limit on the size of "
+                          "files?)");
     const std::string cause = WIFSIGNALED(end.status)
                                   ? std::string(strsignal(WTERMSIG(end.status)))
                                   : "exit code " + std::to_string(WEXITSTATUS(end.status));
-    return ShellFailure(job.source, "crashed", "the conversion crashed (" + cause + "); nothing was written");
+    return MakeNotice(job.source, "crashed", "the conversion crashed (" + cause + "); nothing was written");
 }
 
 void Emit(const std::string& text, std::FILE* file)
@@ -126,9 +126,9 @@ bool CFileRun::OpenReport()
 {
     if (options_.report.empty())
         return true;
-    if (const std::optional<CReport> refusal = WhyNotReport())
+    if (const std::optional<Notice> refusal = WhyNotReport())
     {
-        SayReport(options_, *refusal);
+        SayNotice(options_, *refusal);
         return false;
     }
     if (m_kReport.Open(options_.report, CReportFile::EStart::Empty))
@@ -137,15 +137,15 @@ bool CFileRun::OpenReport()
     return false;
 }
 
-std::optional<CReport> CFileRun::WhyNotReport() const
+std::optional<Notice> CFileRun::WhyNotReport() const
 {
     const std::string& path = options_.report;
     const auto isReport = [&](const std::string& other) { return IsSameFile(path, other); };
     if (std::ranges::any_of(m_kJobs, isReport, &ConversionJob::source) ||
         std::ranges::any_of(m_kJobs, isReport, &ConversionJob::output) || isReport(options_.filesFrom) ||
         isReport(options_.html) || isReport(options_.profile))
-        return ShellFailure(path, "in-use",
-                            "the run reads or writes this file; choose another file for the report");
+        return MakeNotice(path, "in-use",
+                          "the run reads or writes this file; choose another file for the report");
     if (options_.resume && CReportFile::IsReport(path))
         return std::nullopt; // a further message would repeat the first one
     return WhyNotWrite(options_, path);
@@ -241,7 +241,7 @@ CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t i
             end = Convert(options, index, text.File());
     } catch (const std::bad_alloc&)
     {
-        TellLost(index, ShellFailure(m_kJobs[index].source, "memory", "there is not enough memory"),
+        TellLost(index, MakeNotice(m_kJobs[index].source, "memory", "there is not enough memory"),
                  text.File());
     }
     const std::chrono::duration<double> seconds = std::chrono::steady_clock::now() - start;
@@ -279,11 +279,10 @@ CFileRun::FileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
 CFileRun::FileEnd CFileRun::KeepChanged(size_t index, std::string& line)
 {
     CTextFile text;
-    TellLost(
-        index,
-        ShellFailure(m_kJobs[index].output, "changed",
-                     "this file was changed after the run wrote it, so it was kept; --force replaces it"),
-        text.File());
+    TellLost(index,
+             MakeNotice(m_kJobs[index].output, "changed",
+                        "this file was changed after the run wrote it, so it was kept; --force replaces it"),
+             text.File());
     line = Timed(text.Text(), 0.0);
     return {.endsRun = !options_.keepGoing};
 }
@@ -339,7 +338,7 @@ bool CFileRun::Take(size_t index, const JobEnd& end)
 std::string CFileRun::TakeLost(size_t index, const JobEnd& end)
 {
     CTextFile text;
-    TellLost(index, LostReport(m_kJobs[index], end, options_.timeLimit), text.File());
+    TellLost(index, LostNotice(m_kJobs[index], end, options_.timeLimit), text.File());
     return Timed(text.Text(), end.seconds) + "}\n";
 }
 

@@ -16,7 +16,7 @@
 namespace gw {
 
 class CContentHash;
-struct CReport;
+struct Notice;
 
 /// Where a run keeps its state for the next run.
 struct RunState
@@ -58,7 +58,7 @@ protected:
     /// Converts one source. Called in a worker.
     virtual FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) = 0;
     /// Reports a failure that the conversion could not report itself. Called in a worker or in the program.
-    virtual void TellLost(size_t index, const CReport& reason, std::FILE* record) = 0;
+    virtual void TellLost(size_t index, const Notice& reason, std::FILE* record) = 0;
     /// Reports that an output from an earlier run is up to date. Called in a worker.
     virtual void TellUpToDate(size_t index) = 0;
     /// Returns data for the program in addition to the record. Called in a worker after Convert.
@@ -77,7 +77,7 @@ protected:
 private:
     bool Open();
     bool OpenReport();
-    std::optional<CReport> WhyNotReport() const;
+    std::optional<Notice> WhyNotReport() const;
     bool OpenState();
     bool IsSyncDeferred() const { return m_kJobs.size() > 1; }
     bool SyncResults();

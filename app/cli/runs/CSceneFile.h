@@ -35,7 +35,7 @@ public:
     bool IsContainer() const { return m_bContainer; }
     bool IsDamaged() const { return m_bContainer && Record().Failure(); }
     const CFailureRecord& Record() const { return m_bContainer ? m_kScene.Record() : m_kMotion.Record(); }
-    const CFailure& Failure() const { return Record().Failure(); }
+    const Finding& Failure() const { return Record().Failure(); }
 
     const CMotionFile& Motion() const { return m_kMotion; }
     COrrinStream& Scene() { return m_kScene; }

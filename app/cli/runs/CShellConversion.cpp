@@ -4,10 +4,10 @@
 
 #include "CShellConversion.h"
 
-#include "CShellReports.h"
+#include "CShellNotices.h"
 #include "DoubtWords.h"
-#include "FailureWords.h"
 #include "FindBone.h"
+#include "FindingWords.h"
 #include "Paths.h"
 #include "ProfileChoice.h"
 #include "ProfileFile.h"
@@ -37,21 +37,21 @@ std::vector<std::string> NamesOf(const std::vector<InstalledProfile>& profiles)
     return names;
 }
 
-CReport NotInstalled(const std::string& name, const std::vector<InstalledProfile>& profiles)
+Notice NotInstalled(const std::string& name, const std::vector<InstalledProfile>& profiles)
 {
     const std::string nearest = NearestName(name, NamesOf(profiles));
     const std::string guess = nearest.empty() ? "" : "; did you mean " + Quoted(nearest) + '?';
-    return ShellFailure({}, "not-installed",
-                        "profile " + Quoted(name) + " is not installed" + guess +
-                            " ('gaitwright profiles' lists them)");
+    return MakeNotice({}, "not-installed",
+                      "profile " + Quoted(name) + " is not installed" + guess +
+                          " ('gaitwright profiles' lists them)");
 }
 
 } // namespace
 
 CShellConversion::CShellConversion(const ShellOptions& options, const ConversionChoices& choices,
-                                   CShellReports& reports)
-    : CFileConversion(options.dataFolder, choices, [&](const CReport& report) { reports.Add(report); }),
-      options_(options), reports_(reports)
+                                   CShellNotices& notices)
+    : CFileConversion(options.dataFolder, choices, [&](const Notice& notice) { notices.Add(notice); }),
+      options_(options), notices_(notices)
 {
 }
 
@@ -61,7 +61,7 @@ bool CShellConversion::Open(const std::string& path)
         return false;
     if (options_.profile.empty())
         PickStockProfile();
-    return !reports_.HasFailed();
+    return !notices_.HasFailed();
 }
 
 // Selects the first stock profile that fits.
@@ -124,9 +124,9 @@ std::string CShellConversion::ResolveProfile(const std::string& nameOrFile)
     if (ReadProfileText(nameOrFile, text))
         return nameOrFile;
     if (HasExtension(nameOrFile, ".prf") || FileExists(nameOrFile))
-        Report(MakeReport(nameOrFile, EMisfit::BadProfile));
+        Notify(MakeNotice(nameOrFile, {EFailure::BadProfile}));
     else
-        Report(NotInstalled(nameOrFile, InstalledProfiles()));
+        Notify(NotInstalled(nameOrFile, InstalledProfiles()));
     return {};
 }
 
@@ -173,7 +173,7 @@ bool CShellConversion::SelectFitting()
     nearest_.emplace();
     if (!choices.empty())
         Measure(choices.front().path, *nearest_);
-    Report(NoneFitsReport(SourcePath(), *nearest_));
+    Notify(NoneFitsNotice(SourcePath(), *nearest_));
     return false;
 }
 
@@ -185,8 +185,8 @@ void CShellConversion::WarnOfStockPick() const
     {
         std::erase_if(choice.verdict.doubts,
                       [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
-        for (const CReport& warning : DoubtWarnings(SourcePath(), choice))
-            Report(warning);
+        for (const Notice& warning : DoubtWarnings(SourcePath(), choice))
+            Notify(warning);
     }
 }
 
@@ -194,11 +194,11 @@ bool CShellConversion::Take(const ProfileChoice& choice)
 {
     if (choice.verdict.sureness == ESureness::Doubtful)
     {
-        Report(DoubtfulReport(SourcePath(), choice));
+        Notify(DoubtfulNotice(SourcePath(), choice));
         return false;
     }
-    for (const CReport& warning : DoubtWarnings(SourcePath(), choice))
-        Report(warning);
+    for (const Notice& warning : DoubtWarnings(SourcePath(), choice))
+        Notify(warning);
     chosen_ = choice;
     UseProfile(choice.path, choice.profile);
     return true;

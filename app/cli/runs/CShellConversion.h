@@ -13,7 +13,7 @@
 
 namespace gw {
 
-class CShellReports;
+class CShellNotices;
 struct ShellOptions;
 
 /// An installed profile.
@@ -30,8 +30,8 @@ struct InstalledProfile
 class CShellConversion : public CFileConversion
 {
 public:
-    /// Options and reports must outlive the conversion.
-    CShellConversion(const ShellOptions& options, const ConversionChoices& choices, CShellReports& reports);
+    /// Options and notices must outlive the conversion.
+    CShellConversion(const ShellOptions& options, const ConversionChoices& choices, CShellNotices& notices);
 
     /// Opens a source and loads the target. If no profile was named, selects a stock profile that fits.
     /// Returns false, after reporting the reason, if anything failed.
@@ -64,7 +64,7 @@ private:
     bool Take(const ProfileChoice& choice);
 
     const ShellOptions& options_;
-    const CShellReports& reports_;
+    const CShellNotices& notices_;
     std::deque<CProfileTexts> m_kTexts;                      ///< of the folders of installed profiles
     std::optional<std::vector<InstalledProfile>> installed_; ///< set when first needed
     std::optional<ProfileChoice> chosen_;

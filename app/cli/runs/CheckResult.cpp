@@ -31,8 +31,8 @@ ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob&
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, const std::string& profilePath)
 {
     std::vector<BonePair> pairs;
-    std::vector<PairMisfit> misfits;
-    if (!ReadBonePairs(profilePath, motion.sourceClip.root, motion.resultClip.root, pairs, misfits))
+    std::vector<MissingBone> missing;
+    if (!ReadBonePairs(profilePath, motion.sourceClip.root, motion.resultClip.root, pairs, missing))
         return std::nullopt;
     MeasuredConversion measured;
     measured.sums = MeasureConversion(motion.sourceClip, motion.resultClip, pairs, &measured.detail);
@@ -44,7 +44,7 @@ std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options,
 {
     if (!options.align && !options.faithful)
         return std::nullopt;
-    CFileConversion conversion(options.dataFolder, {}, [](const CReport&) {});
+    CFileConversion conversion(options.dataFolder, {}, [](const Notice&) {});
     if (!conversion.LoadSource(job.source) || !conversion.LoadTarget() ||
         !conversion.UseProfile(profilePath) || !conversion.Convert(!options.noLegs))
         return std::nullopt;

@@ -8,15 +8,15 @@
 #include "CNode.h"
 #include "CPagePart.h"
 #include "CShellConversion.h"
-#include "CShellReports.h"
-#include "CheckReport.h"
+#include "CShellNotices.h"
 #include "CheckResult.h"
+#include "CheckText.h"
 #include "DoubtWords.h"
+#include "NoticeJson.h"
 #include "Output.h"
 #include "Paths.h"
 #include "ProfileChoice.h"
 #include "ProfileFit.h"
-#include "ReportJson.h"
 #include "ResultSize.h"
 #include "Text.h"
 #include "Words.h"
@@ -63,10 +63,10 @@ void KeepUntilExit(CNode* root)
 class CJobSteps
 {
 public:
-    CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellReports& reports, Account& account,
+    CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices, Account& account,
               CPagePart* part)
-        : options_(options), job_(job), reports_(reports), account_(account), m_pkPart(part),
-          m_kConversion(options, {options.align, options.faithful, !options.noHands}, reports)
+        : options_(options), job_(job), notices_(notices), account_(account), m_pkPart(part),
+          m_kConversion(options, {options.align, options.faithful, !options.noHands}, notices)
     {
     }
 
@@ -90,7 +90,7 @@ public:
         // Another run may have made it meanwhile, such as the workers of a killed one.
         if (options_.skipExisting && IsTaken(job_.output))
             return EConversion::Skipped;
-        if (!m_kConversion.WriteResult(job_.output) || reports_.HasFailed())
+        if (!m_kConversion.WriteResult(job_.output) || notices_.HasFailed())
             return EConversion::Failed;
         if (IsMeasured())
             Check();
@@ -110,7 +110,7 @@ private:
 
     const ShellOptions& options_;
     const ConversionJob& job_;
-    CShellReports& reports_;
+    CShellNotices& notices_;
     Account& account_;
     CPagePart* m_pkPart; // null if no page is requested
     CShellConversion m_kConversion;
@@ -128,9 +128,9 @@ bool CJobSteps::SelectProfile()
 
 bool CJobSteps::MayFit()
 {
-    const std::optional<CReport> refusal = WhyTooLarge(m_kConversion, job_);
+    const std::optional<Notice> refusal = WhyTooLarge(m_kConversion, job_);
     if (refusal)
-        reports_.Add(*refusal);
+        notices_.Add(*refusal);
     return !refusal;
 }
 
@@ -144,7 +144,7 @@ bool CJobSteps::Convert()
             account_.misfit = fit;
         return false;
     }
-    if (reports_.HasFailed())
+    if (notices_.HasFailed())
         return false;
     account_.frames = m_kConversion.Result().GetKeyCount();
     return m_kConversion.HasFrames();
@@ -166,18 +166,18 @@ void CJobSteps::Check()
         m_pkPart->Show(motion);
 }
 
-EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShellReports& reports,
+EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices,
                    Account& account, CPagePart* part, EProcess process)
 {
     if (options.skipExisting && IsTaken(job.output))
         return EConversion::Skipped;
-    const std::optional<CReport> refusal = WhyNotWrite(options, job.output);
+    const std::optional<Notice> refusal = WhyNotWrite(options, job.output);
     if (refusal)
     {
-        reports.Add(*refusal);
+        notices.Add(*refusal);
         return EConversion::Failed;
     }
-    CJobSteps steps(options, job, reports, account, part);
+    CJobSteps steps(options, job, notices, account, part);
     const EConversion outcome = steps.Run();
     if (process == EProcess::Ends)
         steps.KeepMotionsUntilExit();
@@ -226,7 +226,7 @@ void Print(const ConversionJob& job, const Account& account)
 }
 
 void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob& job, const Account& account,
-               const CShellReports& reports)
+               const CShellNotices& notices)
 {
     CJsonWriter json(file);
     json.BeginObject();
@@ -238,7 +238,7 @@ void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob
     json.Key("frames").Integer(account.frames);
     if (account.chosen)
         WriteVerdict(json, account.chosen->verdict);
-    WriteReports(json, reports.All());
+    WriteNotices(json, notices.All());
     if (account.misfit)
     {
         json.Key("fit").BeginObject();
@@ -254,12 +254,12 @@ void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob
 }
 
 void Tell(const ShellOptions& options, const ConversionJob& job, const Account& account,
-          const CShellReports& reports, std::FILE* record)
+          const CShellNotices& notices, std::FILE* record)
 {
     if (record)
-        WriteJson(record, options, job, account, reports);
+        WriteJson(record, options, job, account, notices);
     if (options.json)
-        WriteJson(stdout, options, job, account, reports);
+        WriteJson(stdout, options, job, account, notices);
     if (options.json || options.quiet)
         return;
     Print(job, account);
@@ -277,19 +277,19 @@ const char* OutcomeName(EConversion outcome)
 EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process)
 {
-    CShellReports reports(options);
+    CShellNotices notices(options);
     Account account;
-    account.outcome = Decide(options, job, reports, account, part, process);
-    Tell(options, job, account, reports, record);
+    account.outcome = Decide(options, job, notices, account, part, process);
+    Tell(options, job, account, notices, record);
     return account.outcome;
 }
 
-void TellFailed(const ShellOptions& options, const ConversionJob& job, const CReport& reason,
+void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
                 std::FILE* record)
 {
-    CShellReports reports(options);
-    reports.Add(reason);
-    Tell(options, job, {}, reports, record);
+    CShellNotices notices(options);
+    notices.Add(reason);
+    Tell(options, job, {}, notices, record);
 }
 
 void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why)
@@ -297,7 +297,7 @@ void TellSkipped(const ShellOptions& options, const ConversionJob& job, const ch
     Account account;
     account.outcome = EConversion::Skipped;
     account.whySkipped = why;
-    Tell(options, job, account, CShellReports(options), nullptr);
+    Tell(options, job, account, CShellNotices(options), nullptr);
 }
 
 } // namespace gw

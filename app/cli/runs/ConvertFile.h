@@ -10,7 +10,7 @@
 namespace gw {
 
 class CPagePart;
-struct CReport;
+struct Notice;
 
 /// A source and its output file.
 struct ConversionJob
@@ -45,7 +45,7 @@ EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, s
                         CPagePart* part, EProcess process = EProcess::GoesOn);
 
 /// Reports in the same way a conversion that failed for a reason it could not report itself.
-void TellFailed(const ShellOptions& options, const ConversionJob& job, const CReport& reason,
+void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
                 std::FILE* record);
 /// Reports in the same way a conversion that is skipped.
 void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why);

@@ -44,7 +44,7 @@ bool LoadBytes(const std::string& path, std::span<const std::byte> bytes, const 
 bool LoadWhole(COrrinStream& scene, const std::string& path)
 {
     const bool opened = scene.LoadFile(path, false);
-    const CFailure& failure = scene.Record().Failure();
+    const Finding& failure = scene.Record().Failure();
     if (!opened)
         SayFailure(path, failure);
     else if (failure)

@@ -8,26 +8,29 @@ namespace gw {
 
 namespace {
 
-std::string FaultWords(const std::string& path, EPlanFault fault, size_t line)
+// These reasons need other sentences for plans than for motion files.
+std::string PlanWords(const std::string& path, const Finding& failure)
 {
-    if (fault == EPlanFault::Unreadable)
-        return path + ": the plan cannot be read (check the path and the permissions)";
-    if (fault == EPlanFault::NoPlan)
+    const std::string place = path + ':' + std::to_string(failure.where);
+    switch (failure.reason)
+    {
+    case EFailure::BadHeader:
         return path + ": this is not a plan; create one with 'gaitwright plan'";
-    const std::string place = path + ':' + std::to_string(line);
-    if (fault == EPlanFault::TooDeep)
+    case EFailure::TooDeep:
         return place + ": this line is nested too deeply for a plan; create the plan again";
-    return place + ": this line is not a valid plan entry; create the plan again";
+    case EFailure::UnexpectedLine:
+        return place + ": this line is not a valid plan entry; create the plan again";
+    default:
+        return path + ": the plan cannot be read (check the path and the permissions)";
+    }
 }
 
 } // namespace
 
 bool LoadPlan(const std::string& path, CRunPlan& plan)
 {
-    size_t line = 0;
-    const EPlanFault fault = ReadPlan(path, plan, line);
-    if (fault != EPlanFault::None)
-        SayError(FaultWords(Printable(path), fault, line));
+    if (const Finding failure = ReadPlan(path, plan))
+        SayError(PlanWords(Printable(path), failure));
     else if (plan.version != GAITWRIGHT_VERSION)
         SayError(Printable(path) + ": version " + Printable(plan.version) +
                  " made this plan, and this is version " + GAITWRIGHT_VERSION +

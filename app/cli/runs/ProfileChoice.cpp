@@ -1,19 +1,20 @@
 #include "ProfileChoice.h"
 
 #include "CJsonWriter.h"
-#include "CReport.h"
+#include "ChooseProfile.h"
+#include "DoubtWords.h"
 #include "FitWords.h"
+#include "Notice.h"
 #include "ProfileFit.h"
-#include "Words.h"
 
 namespace gw {
 
-CReport NoneFitsReport(const std::string& source, const CProfileFit& nearest)
+Notice NoneFitsNotice(const std::string& source, const CProfileFit& nearest)
 {
-    CReport report = MisfitReport(source, nearest);
-    report.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
-                                         : "no installed profile fits; the closest is " + report.words;
-    return report;
+    Notice notice = MisfitNotice(source, nearest);
+    notice.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
+                                         : "no installed profile fits; the closest is " + notice.words;
+    return notice;
 }
 
 void WriteFit(CJsonWriter& json, const CProfileFit& fit)
@@ -30,6 +31,24 @@ void WriteFit(CJsonWriter& json, const CProfileFit& fit)
         json.Key("bone").Text(missing.name);
         json.Key("nearest").Text(missing.nearest);
         json.Key("line").Integer(static_cast<int64_t>(missing.line));
+        json.EndObject();
+    }
+    json.EndArray();
+}
+
+void WriteVerdict(CJsonWriter& json, const ProfileVerdict& verdict)
+{
+    json.Key("sureness").Text(SurenessName(verdict.sureness));
+    json.Key("spineJointsLeftOut").Integer(static_cast<int64_t>(verdict.leftOut));
+    json.Key("turn").Number(static_cast<float>(verdict.turn));
+    json.Key("doubts").BeginArray();
+    for (const ProfileDoubt& doubt : verdict.doubts)
+    {
+        json.BeginObject();
+        json.Key("kind").Text(DoubtCode(doubt.kind));
+        json.Key("joint").Text(doubt.joint);
+        json.Key("other").Text(doubt.other);
+        json.Key("words").Text(DoubtSentence(doubt));
         json.EndObject();
     }
     json.EndArray();

@@ -30,7 +30,7 @@ double NumberBytes(double rowCount)
 
 } // namespace
 
-std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job)
+std::optional<Notice> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job)
 {
     CNode* const skeleton = conversion.Result().restRoot.Get();
     const int rate = conversion.Profile().frameRate;
@@ -49,7 +49,7 @@ std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const Conv
         "the result would take at least %.1f GiB (%.0f rows for each of %.0f bones), and a .Kinetra "
         "must be smaller than 2 GiB; split the motion, or write an .htr, which has no such limit",
         bytes / 1073741824.0, rows, bones);
-    return ShellFailure(job.source, "too-large", words);
+    return MakeNotice(job.source, "too-large", words);
 }
 
 } // namespace gw

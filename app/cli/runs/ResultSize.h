@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CReport.h"
+#include "Notice.h"
 
 #include <optional>
 
@@ -11,6 +11,6 @@ struct ConversionJob;
 
 /// Returns why the result of a conversion cannot fit into its file, before any work is done: a .Kinetra holds
 /// less than 2 GiB. Nothing if it may fit; the writer checks the actual size.
-std::optional<CReport> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job);
+std::optional<Notice> WhyTooLarge(const CFileConversion& conversion, const ConversionJob& job);
 
 } // namespace gw

@@ -12,7 +12,7 @@
 #include "CProfileEditorWindow.h"
 #include "CTitleLabel.h"
 #include "FaceChildren.h"
-#include "FailureWords.h"
+#include "FindingWords.h"
 #include "QtText.h"
 #include "StringTable.h"
 
@@ -117,20 +117,20 @@ bool CContent::IsKeyDown(EKey key) const
     return keys_.IsDown(key);
 }
 
-void CContent::Report(const CReport& report)
+void CContent::Notify(const Notice& notice)
 {
-    m_kReports.push_back(report);
+    m_kNotices.push_back(notice);
 }
 
-// One line per report.
+// One line per notice.
 std::string CContent::Notes() const
 {
     std::string text;
-    for (const CReport& report : m_kReports)
+    for (const Notice& notice : m_kNotices)
     {
         if (!text.empty())
             text += '\n';
-        text += ReportLine(report);
+        text += NoticeLine(notice);
     }
     return text;
 }
@@ -140,7 +140,7 @@ void CContent::ShowNoteCount()
     auto* const button = Child<QPushButton>("notes");
     if (!button)
         return;
-    const auto count = static_cast<int>(m_kReports.size());
+    const auto count = static_cast<int>(m_kNotices.size());
     button->setText(count == 1 ? tr(" 1 note") : tr(" %1 notes").arg(count));
     button->setVisible(count > 0);
 }
@@ -160,7 +160,7 @@ void CContent::BeginWaitCursor()
 {
     if (m_iWaits++ > 0)
         return;
-    m_kReports.clear();
+    m_kNotices.clear();
     ShowNoteCount();
     m_kSincePainted.start();
     QGuiApplication::setOverrideCursor(Qt::WaitCursor);

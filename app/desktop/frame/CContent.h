@@ -2,7 +2,7 @@
 
 #include "CContentWindow.h"
 #include "CProfileCombo.h"
-#include "CReport.h"
+#include "Notice.h"
 
 #include <QElapsedTimer>
 #include <QTimer>
@@ -48,7 +48,7 @@ public:
     std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override;
     std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override;
-    void Report(const CReport& report) override;
+    void Notify(const Notice& notice) override;
     bool ShowsFindings() const override { return true; }
     bool IsProgressDue() override;
     void StayPainted() override;
@@ -93,8 +93,8 @@ private:
     std::map<std::string, QWidget*, std::less<>> m_kChildren;
     std::map<int, std::unique_ptr<QTimer>> m_kTimers;
     CProfileCombo m_kCombo;
-    std::vector<CReport> m_kReports; ///< of the current step, or of the last one until the next begins
-    QElapsedTimer m_kSincePainted;   ///< during an operation
+    std::vector<Notice> m_kNotices; ///< of the current step, or of the last one until the next begins
+    QElapsedTimer m_kSincePainted;  ///< during an operation
     int m_iWaits = 0;
 };
 

@@ -31,7 +31,7 @@ public:
 EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons buttons)
 {
     const CArrowCursor arrow;
-    // Reports are cleared when a step begins, so outside a step they are from an earlier one.
+    // Notices are cleared when a step begins, so outside a step they are from an earlier one.
     const std::string details = m_iWaits > 0 && EndsStep(id) ? Notes() : std::string();
     return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, details);
 }

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CByteSink.h"
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CNode.h"
 #include "CTextLines.h"
 #include "HTRPose.h"

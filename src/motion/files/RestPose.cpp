@@ -5,7 +5,7 @@
 
 #include "BodyStance.h"
 #include "BodyTree.h"
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "Skeleton.h"
 #include "Text.h"
 

@@ -1,6 +1,6 @@
 #pragma once
 
-#include "CFailure.h"
+#include "CFailureRecord.h"
 #include "CNode.h"
 #include "Mat3.h"
 #include "Vec3.h"

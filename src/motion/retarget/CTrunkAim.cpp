@@ -1,15 +1,18 @@
-// A trunk's bones can point exactly as the source's and the trunk still lean otherwise: joints lie at other
-// shares of its length, so a bend at the source's hips may come out in the target's waist. What is seen is
-// the line from hips to neck. So the source's line is measured by its arc length, the target's joints are
-// looked up on it at their own shares, and each bone is aimed from one such point to the next.
+// A trunk's bones can all point exactly like the source's, and the trunk can still lean differently: its
+// joints are at other fractions of its length, so a bend at the source's hips may end up in the target's
+// waist. What a viewer sees is the line from hips to neck. So the source's line is measured by arc length,
+// the target's joints are looked up on it at their own fractions, and each bone is aimed from one such point
+// to the next. If the two lines differ in the rest poses, the target keeps that difference: it stands upright
+// when its source does.
 //
-// A bent line is shorter between two points than its arc, and the target's pelvis keeps its own turn. So the
-// bones are turned together by the least angle that brings the neck back onto the source's direction: with p
-// the way from hips to LowerTorso, q from there to the neck and c the source's direction, q must become
+// A bent line is shorter between two points than its arc, and the target's pelvis keeps its own rotation. So
+// all bones are rotated together by the smallest angle that brings the neck back to the wanted direction:
+// with p the vector from hips to LowerTorso, q the vector from there to the neck, and c the wanted direction,
+// q must become
 //
 //     l c - p,    l = c . p + sqrt((c . p)^2 - |p|^2 + |q|^2)
 //
-// which has q's length and makes p + q a multiple of c.
+// which has the length of q and makes p + q a multiple of c.
 
 #include "CTrunkAim.h"
 
@@ -26,6 +29,10 @@
 namespace gw {
 
 namespace {
+
+// A larger difference between the lines at rest comes from a pose in which nobody stands, not from
+// proportions.
+constexpr double kMostRestDegrees = 30.0;
 
 constexpr const char* kTrunkJoints[] = {kRootBone, kWaistBone, kTorsoBone, kNeckBone};
 
@@ -47,6 +54,7 @@ CTrunkAim::CTrunkAim(const CRetargeter& retargeter, const CPoseMatcher& matcher,
     if (!m_kLine.IsWhole())
         return;
     PlanShares(*neck, *top);
+    PlanRest();
     PlanHanging(matcher);
     m_bIsPlanned = true;
 }
@@ -67,16 +75,45 @@ bool CTrunkAim::FindBones(const CPoseMatcher& matcher, CNode* targetRoot)
     return m_apkThighs[0] && m_apkThighs[1];
 }
 
+Vec3 CTrunkAim::RestHips() const
+{
+    return (RestWorld(*m_apkThighs[0]).Translation() + RestWorld(*m_apkThighs[1]).Translation()) * 0.5f;
+}
+
 void CTrunkAim::PlanShares(const CNode& neck, const CNode& top)
 {
-    const Vec3 hips =
-        (RestWorld(*m_apkThighs[0]).Translation() + RestWorld(*m_apkThighs[1]).Translation()) * 0.5f;
-    m_afShares[0] = Vec3Length(RestWorld(*m_apkJoints[0]).Translation() - hips);
+    m_afShares[0] = Vec3Length(RestWorld(*m_apkJoints[0]).Translation() - RestHips());
     for (size_t i = 1; i <= kBones; ++i)
         m_afShares[i] = m_afShares[i - 1] + RestDistance(*m_apkJoints[i - 1], *m_apkJoints[i]);
     const double whole = m_afShares[kBones] + RestDistance(neck, top);
     for (double& share : m_afShares)
         share /= whole;
+}
+
+// The source's direction from its hips to where the target's neck is on the line.
+Vec3 CTrunkAim::Chord() const
+{
+    return Vec3Normalized(m_kLine.At(m_afShares[kBones]) - m_kLine.At(0.0));
+}
+
+// Skeletons whose lines differ at rest, because one has its neck farther back, keep that difference: a target
+// that stands upright when its source does.
+void CTrunkAim::PlanRest()
+{
+    if (!m_kLine.Read())
+        return;
+    const Mat3 upright = TurnUpright(Chord(), Vec3Normalized(m_kLine.Across()));
+    const Vec3 target = RestWorld(*m_apkJoints[kBones]).Translation() - RestHips();
+    const Vec3 chord = Vec3Normalized(Turned(target, upright));
+    if (AngleBetween(chord, kVec3UnitY) <= kMostRestDegrees)
+        m_kRestSwing = LeastSwing(kVec3UnitY, chord);
+}
+
+// The same difference in the present pose: it goes along with the source's trunk.
+Mat3 CTrunkAim::RestTurn() const
+{
+    const Mat3 upright = TurnUpright(Chord(), Vec3Normalized(m_kLine.Across()));
+    return upright * m_kRestSwing * Mat3Transpose(upright);
 }
 
 void CTrunkAim::PlanHanging(const CPoseMatcher& matcher)
@@ -119,14 +156,14 @@ Vec3 CTrunkAim::Pelvis(const CPoseMatcher& matcher) const
 std::array<Vec3, CTrunkAim::kBones> CTrunkAim::Directions(const Vec3& pelvis) const
 {
     const bool rides = pelvis == kVec3Zero;
-    const Vec3 hips = m_kLine.At(0.0);
-    const Vec3 chord = Vec3Normalized(m_kLine.At(m_afShares[kBones]) - hips);
+    const Mat3 rest = RestTurn();
+    const Vec3 chord = Turned(Chord(), rest);
     std::array<Vec3, kBones> directions;
     Vec3 way = kVec3Zero;
     for (size_t i = 0; i < kBones; ++i)
     {
         const double from = rides && i == 0 ? 0.0 : m_afShares[i];
-        directions[i] = Vec3Normalized(m_kLine.At(m_afShares[i + 1]) - m_kLine.At(from));
+        directions[i] = Turned(Vec3Normalized(m_kLine.At(m_afShares[i + 1]) - m_kLine.At(from)), rest);
         way = way + directions[i] * static_cast<float>(m_afShares[i + 1] - from);
     }
     const Vec3 below = Vec3Normalized(pelvis) * static_cast<float>(rides ? 0.0 : m_afShares[0]);

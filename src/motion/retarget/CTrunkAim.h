@@ -8,9 +8,9 @@
 
 namespace gw {
 
-/// Lets the target's trunk lean and bend as the source's line from the middle of its hip joints up to its
-/// neck, whatever the proportions of the two: the way from hips to neck points as the source's does. Bones
-/// that hang on the trunk keep their world rotations.
+/// Makes the target's trunk lean and bend like the source's line from the middle of its hip joints to its
+/// neck, regardless of proportions: the line from hips to neck points in the source's direction, apart from
+/// the difference that the two rest poses have. Bones attached to the trunk keep their world rotations.
 class CTrunkAim
 {
 public:
@@ -28,7 +28,11 @@ private:
 
     bool FindBones(const CPoseMatcher& matcher, CNode* targetRoot);
     void PlanShares(const CNode& neck, const CNode& top);
+    void PlanRest();
     void PlanHanging(const CPoseMatcher& matcher);
+    Vec3 RestHips() const;
+    Vec3 Chord() const;
+    Mat3 RestTurn() const;
     Vec3 Pelvis(const CPoseMatcher& matcher) const;
     std::array<Vec3, kBones> Directions(const Vec3& pelvis) const;
     void TurnTrunk(CPoseMatcher& matcher, const std::array<Vec3, kBones>& directions);
@@ -39,10 +43,11 @@ private:
     std::array<size_t, kBones> m_auiBones{};
     std::array<double, kBones + 1> m_afShares{}; // of the joints on the line
     std::array<CNode*, 2> m_apkThighs{};         // of the target
-    std::vector<size_t> m_kRiders;               // unposed bones that hang on the trunk; parents first
-    std::vector<size_t> m_kHanging;              // posed bones that hang on the trunk or on those
-    std::vector<Mat3> m_kKept;                   // the world rotations of these, by m_kHanging
-    std::vector<Mat3> m_kWorlds;                 // by bone; of trunk and riders, in the pose that is aimed
+    Mat3 m_kRestSwing = kMat3Identity; // from the source's line at rest to the target's, in trunk axes
+    std::vector<size_t> m_kRiders;     // unposed bones that hang on the trunk; parents first
+    std::vector<size_t> m_kHanging;    // posed bones that hang on the trunk or on those
+    std::vector<Mat3> m_kKept;         // the world rotations of these, by m_kHanging
+    std::vector<Mat3> m_kWorlds;       // by bone; of trunk and riders, in the pose that is aimed
 };
 
 } // namespace gw

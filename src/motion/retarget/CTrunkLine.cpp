@@ -25,7 +25,8 @@ std::vector<CNode*> CTrunkLine::Joints() const
 
 bool CTrunkLine::Read()
 {
-    m_kPoints.assign(1, (PlaceOf(*m_apkThighs[0]) + PlaceOf(*m_apkThighs[1])) * 0.5f);
+    m_kAcross = PlaceOf(*m_apkThighs[0]) - PlaceOf(*m_apkThighs[1]);
+    m_kPoints.assign(1, PlaceOf(*m_apkThighs[1]) + m_kAcross * 0.5f);
     m_kArc.assign(1, 0.0);
     for (const CNode* joint : m_kSpine)
     {

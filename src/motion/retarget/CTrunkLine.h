@@ -23,12 +23,15 @@ public:
     std::vector<CNode*> Joints() const;
     /// Takes the joints' present places. False for a line without a length.
     bool Read();
+    /// The direction from the second hip joint to the first; not normalized.
+    Vec3 Across() const { return m_kAcross; }
     /// The point at a share, 0 to 1, of the line's length from the hips up.
     Vec3 At(double share) const;
 
 private:
     std::array<CNode*, 2> m_apkThighs{};
     std::vector<CNode*> m_kSpine; // above the hips, the top included
+    Vec3 m_kAcross = kVec3Zero;
     std::vector<Vec3> m_kPoints;
     std::vector<double> m_kArc; // how far along the line each point lies
 };

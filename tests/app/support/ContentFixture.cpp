@@ -21,10 +21,10 @@ EAnswer CScriptedWindow::ShowMessageBox(int id, const std::string& text, EButton
     return answer == m_kAnswers.end() ? EAnswer::OK : answer->second;
 }
 
-void CScriptedWindow::Report(const CReport& report)
+void CScriptedWindow::Notify(const Notice& notice)
 {
-    m_kReports.push_back(report);
-    m_kCalls.push_back("report " + report.code + (report.name.empty() ? "" : ' ' + report.name));
+    m_kNotices.push_back(notice);
+    m_kCalls.push_back("notice " + notice.code + (notice.name.empty() ? "" : ' ' + notice.name));
 }
 
 void CScriptedWindow::SetChildText(std::string_view child, const std::string& text)
@@ -42,7 +42,7 @@ std::string CScriptedWindow::TakeWords()
     {
         std::string_view rest = call;
         const std::string_view verb = NextWord(rest);
-        if (verb == "report" || verb == "box")
+        if (verb == "notice" || verb == "box")
             words.append(words.empty() ? "" : ", ").append(rest.substr(1));
     }
     return words;

@@ -38,7 +38,7 @@ public:
     std::optional<std::string> AskSaveFile(const FileDialogSetup& setup) override;
     std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
-    void Report(const CReport& report) override;
+    void Notify(const Notice& notice) override;
     void StayPainted() override { onPaint(); }
     bool IsProgressDue() override { return m_bProgressDue; }
     void BeginWaitCursor() override { ++m_iWaits; }
@@ -68,7 +68,7 @@ public:
     std::set<std::string> Enabled() const;
     /// Returns the calls since the last time.
     std::vector<std::string> TakeCalls() { return std::exchange(m_kCalls, {}); }
-    /// Returns only the reports and message boxes: "not-found, 138".
+    /// Returns only the notices and message boxes: "not-found, 138".
     std::string TakeWords();
 
     std::optional<std::string> openAnswer;
@@ -83,7 +83,7 @@ public:
     std::function<bool(CBoneOffsetDialog& dialog)> onBoneOffset = [](CBoneOffsetDialog&) { return false; };
     CProfileList m_kList;
     std::map<std::string, bool> m_kEnabled;
-    std::vector<CReport> m_kReports; ///< also among the calls, as "report CODE NAME"
+    std::vector<Notice> m_kNotices; ///< also among the calls, as "notice CODE NAME"
     std::vector<std::string> m_kTitles;
     std::string m_kPlace;              ///< frame and seconds next to the bar
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes

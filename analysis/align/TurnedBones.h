@@ -9,7 +9,7 @@ class CNode;
 class CRetargeter;
 
 /// A target bone that the source's rest pose would rotate away from the target's, and the angle in degrees.
-struct RestMisfit
+struct TurnedBone
 {
     std::string target;
     std::string source;
@@ -18,6 +18,6 @@ struct RestMisfit
 
 /// Returns the limbs, and the neck, that a retargeter's rows with their offsets rotate by more than a profile
 /// would intend in the source's rest pose. Trees need not be posed.
-std::vector<RestMisfit> FindRestMisfits(const CRetargeter& table, CNode& targetRoot);
+std::vector<TurnedBone> FindTurnedBones(const CRetargeter& table, CNode& targetRoot);
 
 } // namespace gw

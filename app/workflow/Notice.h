@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Finding.h"
+
 #include <cstddef>
 #include <string>
 
@@ -7,14 +9,23 @@ namespace gw {
 
 /// Something that the fixed messages do not contain: why an operation failed, or what a user should know
 /// although it succeeded.
-struct CReport
+struct Notice
 {
-    bool warning = false;
+    ESeverity severity = ESeverity::Error;
     std::string path;  ///< the file concerned, or empty
     size_t where = 0;  ///< line of a text, starting at 1, or byte of a container; 0 if unknown
     std::string code;  ///< a short fixed word for programs: "blank-line"
     std::string name;  ///< bone, keyword, class or text concerned, as written in the file
     std::string words; ///< a sentence for people, with the remedy if there is one; safe to print
+
+    bool IsWarning() const { return severity != ESeverity::Error; }
 };
+
+/// Returns a notice about a whole file.
+Notice MakeNotice(const std::string& path, const char* code, const std::string& words,
+                  ESeverity severity = ESeverity::Error);
+
+/// Returns the notice as one line: "walk.bvh:12: an empty line ...".
+std::string NoticeLine(const Notice& notice);
 
 } // namespace gw

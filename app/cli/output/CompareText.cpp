@@ -1,4 +1,4 @@
-#include "CompareReport.h"
+#include "CompareText.h"
 
 #include "CJsonWriter.h"
 #include "ConversionMeasures.h"

@@ -1,4 +1,4 @@
-#include "RestMisfits.h"
+#include "TurnedBones.h"
 
 #include "BoneMeshQueries.h"
 #include "CBoneMesh.h"
@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kMisfit = 40.0; // in degrees: an A-pose's legs and bent knees are below, a wrong frame is 90
+constexpr double kTurned = 40.0; // in degrees: an A-pose's legs and bent knees are below, a wrong frame is 90
 
 struct BoneRow
 {
@@ -42,9 +42,9 @@ Mat3 RestBone(const CNode& source)
 
 } // namespace
 
-std::vector<RestMisfit> FindRestMisfits(const CRetargeter& table, CNode& targetRoot)
+std::vector<TurnedBone> FindTurnedBones(const CRetargeter& table, CNode& targetRoot)
 {
-    std::vector<RestMisfit> misfits;
+    std::vector<TurnedBone> bones;
     for (const auto& [name, planted] : kBones)
     {
         const CNode* const target = FindNode(&targetRoot, name);
@@ -56,10 +56,10 @@ std::vector<RestMisfit> FindRestMisfits(const CRetargeter& table, CNode& targetR
         const Mat3 turned = offset * RestBone(*source);
         const Mat3 swing = planted ? LeastSwing(turned.Row(1), rest.Row(1)) : kMat3Identity;
         const double degrees = AngleOf(turned * swing * Mat3Transpose(rest));
-        if (degrees > kMisfit)
-            misfits.push_back({name, std::string(source->NameView()), degrees});
+        if (degrees > kTurned)
+            bones.push_back({name, std::string(source->NameView()), degrees});
     }
-    return misfits;
+    return bones;
 }
 
 } // namespace gw

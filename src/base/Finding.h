@@ -3,13 +3,10 @@
 #include <cstddef>
 #include <cstdint>
 #include <string>
-#include <utility>
-#include <vector>
 
 namespace gw {
 
-/// Why a reader or writer gave up, or what it warns about. The messages for these are written at the command
-/// level.
+/// What can be wrong with a file or a conversion. Only app/workflow/FindingWords has sentences for these.
 enum class EFailure : uint8_t
 {
     None,
@@ -52,42 +49,74 @@ enum class EFailure : uint8_t
     OpenHeader,     ///< an unclosed header, so the motion after it has no frames
     /// a linked picture that was not decoded, because the scene's pictures take too much memory
     SkippedPicture,
+
+    // Found by examining a motion file. From here on, readers and writers do not use the reasons.
+    LfsPointer,
+    NotText,
+    ByteOrderMark,
+    CarriageReturn,
+    StrayCharacter,
+    KeywordSpelling,
+    BraceOnLine,
+    BlankInName,
+    SameName,
+    ChannelCount,   ///< more channels listed than counted
+    IgnoredChannel, ///< an unknown channel, as UnknownChannel
+    SecondRoot,
+    EmptyLineBeforeFrames,
+    EmptyLineInRows,
+    DecimalComma,
+    RateForTime, ///< the frame time looks like a rate
+    MissingRows,
+    SurplusRows,
+    NoFrames,
+    CutRow,  ///< a row with too few values, so that readers misread all rows after it
+    LongRow, ///< a row with more values than there are channels
+    NaN,
+    NotNumber,        ///< a value that is not a number, or is followed by something else
+    DoubledBone,      ///< positions repeat the offset, as DoubledOffsets
+    DoubledHipOffset, ///< the hip's height is both in its offset and in its channels
+    Spike,
+    StillRoot, ///< the joint below the root carries the motion
+    SidesSwapped,
+    WrongRate, ///< the steps of the walk do not match the frame rate
+    MixedChannels,
+
+    // Found by a conversion: the motion was read but cannot be converted, or not well.
+    NoScene,          ///< no source is open, or base.htr could not be read
+    NoProfile,        ///< no profile is selected
+    BadProfile,       ///< the profile's file cannot be read
+    NoRootRow,        ///< no row drives the target's root bone
+    NoRootSource,     ///< the row of the target's root bone is fixed
+    NothingToConvert, ///< the source has no frames
+    NoBody,           ///< the rows drive too little of a body to align it
+    TurnedAtRest,     ///< rows rotate limbs in the source's rest pose; `name` is one of its joints
 };
 
-/// A failure or warning.
-struct CFailure
+enum class ESeverity : uint8_t
+{
+    Error,   ///< refused, or read differently than intended
+    Warning, ///< read, but visible in a conversion
+    Note,    ///< valid, but good to know
+};
+
+/// One thing that was found: why something failed, or what a user should know although it did not.
+struct Finding
 {
     EFailure reason = EFailure::None;
-    size_t where = 0; ///< line in a text, starting at 1, or byte in a container; 0 if unknown
-    std::string name; ///< the bone, keyword, class or text concerned
+    size_t where = 0;      ///< line of a text, starting at 1, or byte of a container; 0 if unknown
+    std::string name = {}; ///< bone, keyword, class or text concerned; may be empty
+    ESeverity severity = ESeverity::Error;
+    bool mendable = false; ///< fixed in a repaired copy
+    size_t more = 0;       ///< further findings like this one, which are only counted
 
     explicit operator bool() const { return reason != EFailure::None; }
 };
 
-/// The failures of one stream: the first error, and warnings.
-class CFailureRecord
+/// Returns whether readers and writers use a reason, rather than an examination or a conversion.
+constexpr bool IsOfReader(EFailure reason)
 {
-public:
-    /// Records the first failure and ignores later ones. Always returns false, so that `return
-    /// record.Fail(...)` works.
-    bool Fail(EFailure reason, size_t where = 0, std::string name = {})
-    {
-        if (!m_kFailure)
-            m_kFailure = {reason, where, std::move(name)};
-        return false;
-    }
-    /// Records a warning; only the first kWarningsPerReason of each reason are kept.
-    void Warn(EFailure reason, size_t where = 0, std::string name = {});
-    void Clear() { *this = {}; }
-
-    const CFailure& Failure() const { return m_kFailure; }
-    const std::vector<CFailure>& Warnings() const { return m_kWarnings; }
-
-private:
-    static constexpr int kWarningsPerReason = 8;
-
-    CFailure m_kFailure;
-    std::vector<CFailure> m_kWarnings;
-};
+    return reason < EFailure::LfsPointer;
+}
 
 } // namespace gw

@@ -1,7 +1,7 @@
-#include "CheckReport.h"
+#include "CheckText.h"
 
 #include "CJsonWriter.h"
-#include "CompareReport.h"
+#include "CompareText.h"
 #include "ConvertedMotion.h"
 #include "KeyFigures.h"
 #include "Text.h"

@@ -1,4 +1,4 @@
-#include "AlignNeeds.h"
+#include "RestCorrections.h"
 
 #include "Alignment.h"
 #include "BodyPose.h"
@@ -19,20 +19,6 @@ namespace {
 // in degrees: the maximum angle of a limb from its axis, or of its frame's twist
 constexpr double kOffAxis = 30.0;
 
-bool IsLimb(EBodyPart part)
-{
-    switch (part)
-    {
-    case EBodyPart::UpperArm:
-    case EBodyPart::Forearm:
-    case EBodyPart::Thigh:
-    case EBodyPart::Shin:
-        return true;
-    default:
-        return false;
-    }
-}
-
 // Returns the twist of a bone's frame, compared with one that is only swung from an axis.
 double FrameTwist(const CNode& joint)
 {
@@ -47,10 +33,10 @@ double FrameTwist(const CNode& joint)
 
 } // namespace
 
-std::vector<AlignFinding> FindRestNeeds(const CTreePoser& tree, const std::vector<JointRole>& roles,
-                                        double legLength)
+std::vector<Correction> FindRestCorrections(const CTreePoser& tree, const std::vector<JointRole>& roles,
+                                            double legLength)
 {
-    std::vector<AlignFinding> findings;
+    std::vector<Correction> corrections;
     for (size_t i = 0; i < roles.size(); ++i)
     {
         const CNode& joint = *tree.Joints()[i];
@@ -59,12 +45,12 @@ std::vector<AlignFinding> FindRestNeeds(const CTreePoser& tree, const std::vecto
             continue;
         const double off = AngleBetween(way, AxisOf(roles[i]));
         if (off > kOffAxis)
-            findings.push_back({EAlignNeed::RestPose, std::string(joint.NameView()), off});
+            corrections.push_back({ECorrection::RestPose, std::string(joint.NameView()), off});
         const double twist = FrameTwist(joint);
         if (twist > kOffAxis)
-            findings.push_back({EAlignNeed::BoneFrames, std::string(joint.NameView()), twist});
+            corrections.push_back({ECorrection::BoneFrames, std::string(joint.NameView()), twist});
     }
-    return findings;
+    return corrections;
 }
 
 } // namespace gw

@@ -1,0 +1,39 @@
+#pragma once
+
+#include "CFileConversion.h"
+#include "Words.h"
+
+#include <vector>
+
+namespace gw {
+
+struct ShellOptions;
+
+/// The notices of a conversion: printed to standard error immediately and kept, except for the program's
+/// fixed messages, which other programs do not need.
+class CShellNotices
+{
+public:
+    /// The options must outlive the notices.
+    explicit CShellNotices(const ShellOptions& options) : options_(options) {}
+
+    void Add(const Notice& notice)
+    {
+        SayNotice(options_, notice);
+        if (notice.code == kFixedMessage)
+            return;
+        notices_.push_back(notice);
+        hasFailed_ = hasFailed_ || !notice.IsWarning();
+    }
+    /// Returns whether there was a notice that is not a warning.
+    bool HasFailed() const { return hasFailed_; }
+    /// Returns all notices, in order.
+    const std::vector<Notice>& All() const { return notices_; }
+
+private:
+    const ShellOptions& options_;
+    std::vector<Notice> notices_;
+    bool hasFailed_ = false;
+};
+
+} // namespace gw
