@@ -9,7 +9,7 @@
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
 #   ./build.sh package      makes Debian packages in build/release/packages and tries them
 #   ./build.sh cluster-test runs the lines of docs/clusters.md with Slurm and GNU parallel on this machine
-#   ./build.sh lint [REVISION]  checks formatting and runs the linter, on what has changed since a revision or on all
+#   ./build.sh lint [COUNT]  checks formatting and runs the linter, on all sources or on those that were changed last
 set -euo pipefail
 cd "$(dirname "$0")"
 
@@ -101,12 +101,13 @@ fuzz() {
   return $failed
 }
 
-# sources_to_lint [REVISION]: all sources, or those that are changed, or whose header is, since a revision.
+# sources_to_lint [COUNT]: all sources, or the ones that were changed last, also by way of their header.
 sources_to_lint() {
   if [ -z "${1:-}" ]; then
     git ls-files '*.cpp'
   else
-    git diff --name-only "$1" -- '*.cpp' '*.h' | sed 's/\.h$/.cpp/' | sort -u | xargs -r git ls-files
+    git log --format= --name-only -- '*.cpp' '*.h' | sed 's/\.h$/.cpp/' | awk '!seen[$0]++' |
+      grep -Fxf <(git ls-files '*.cpp') | sed "$1q"
   fi | grep -v '^bench/load_baseline' || true
 }
 

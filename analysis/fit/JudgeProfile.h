@@ -44,7 +44,8 @@ struct SourceBody
 {
     explicit SourceBody(CNode& root);
 
-    /// What CheckBody returns. Most maps of one rig differ only in their rotations, so the last answer is kept.
+    /// What CheckBody returns. Most maps of one rig differ only in their rotations, so the last answer is
+    /// kept.
     const std::vector<BodyDoubt>& Check(const CBodyMap& body);
 
     CBodyMap byNames; ///< found by joint names

@@ -34,8 +34,8 @@ public:
     virtual uint32_t ThreadLocale() const = 0;
 };
 
-/// Returns the folder of the user's own profiles with a trailing separator: in the host product's folder of custom
-/// data, whose key path is given, or in the user's documents if the product is not installed.
+/// Returns the folder of the user's own profiles with a trailing separator: in the host product's folder of
+/// custom data, whose key path is given, or in the user's documents if the product is not installed.
 std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath);
 
 /// Returns the primary language of a locale number.

@@ -174,8 +174,8 @@ void CConversion::NotifyOfMisfit()
     notify_(MakeNotice(input_.profilePath, {reason}));
 }
 
-// Notifies of the rows that name missing bones; returns false if there are none. Line numbers are included if the
-// profile is unchanged from its file.
+// Notifies of the rows that name missing bones; returns false if there are none. Line numbers are included if
+// the profile is unchanged from its file.
 bool CConversion::NotifyOfMissingBones()
 {
     CNode* const target = target_.motionRoot.Get();

@@ -33,10 +33,7 @@ public:
 
     std::span<Vec3> UVWBuffer() { return m_kUVW; }
     std::span<uint32_t> VertexUVWMap() { return m_kVertexUVW; } ///< the coordinate of each render vertex
-    std::span<uint32_t> UVWTriIndexBuffer()
-    {
-        return m_kUVWTriIndex;
-    } ///< three coordinates per triangle
+    std::span<uint32_t> UVWTriIndexBuffer() { return m_kUVWTriIndex; } ///< three coordinates per triangle
     /// Returns the triangle count as stored in the file or set last.
     int32_t GetTriangleQuantity() const { return m_iTriangleCount; }
 

@@ -1,5 +1,5 @@
-// Turns fields into table rows. Each kind of value has one formatting function in kTextOf. An array is one row:
-// everything in it, nested arrays included, is appended to the row's cell.
+// Turns fields into table rows. Each kind of value has one formatting function in kTextOf. An array is one
+// row: everything in it, nested arrays included, is appended to the row's cell.
 
 #include "CFieldRows.h"
 

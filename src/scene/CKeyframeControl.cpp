@@ -1,7 +1,7 @@
 // Keyframe interpolation. The tracks are sampled separately: linear for positions and scales, spherical for
 // rotations. Each track remembers where the last search ended, because playback asks for ascending times. The
-// target's local matrix becomes S · R of the samples; the parent's pose is undone if the mask asks for it, and
-// the position is added last.
+// target's local matrix becomes S · R of the samples; the parent's pose is undone if the mask asks for it,
+// and the position is added last.
 
 #include "CKeyframeControl.h"
 

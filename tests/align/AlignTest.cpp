@@ -375,11 +375,11 @@ TEST(UpAxis, IsThatOfABodyThatIsUpsideDownForPartOfTheMotion)
         Mat3 world;
         Vec3 up;
     } rows[] = {
-        {"Y up",                       Everywhere(kMat3Identity), kMat3Identity, kVec3UnitY},
-        {"Z up, with a rest pose too", Everywhere(zUp),           zUp,           kVec3UnitZ},
-        {"Z up in the motion alone",   Everywhere(kMat3Identity), zUp,           kVec3UnitZ},
-        {"bones along X, with Z up",   AlongX,                    zUp,           kVec3UnitZ},
-        {"bones along X",              AlongX,                    kMat3Identity, kVec3UnitY},
+        {"Y up", Everywhere(kMat3Identity), kMat3Identity, kVec3UnitY},
+        {"Z up, with a rest pose too", Everywhere(zUp), zUp, kVec3UnitZ},
+        {"Z up in the motion alone", Everywhere(kMat3Identity), zUp, kVec3UnitZ},
+        {"bones along X, with Z up", AlongX, zUp, kVec3UnitZ},
+        {"bones along X", AlongX, kMat3Identity, kVec3UnitY},
     };
     for (const auto& row : rows)
     {

@@ -335,12 +335,8 @@ TEST(TKHTRStream, QuarterTurnsReadBackWhereThatIsAskedFor)
         Vec3 degrees;
         double flippedBy; // read back from what the rule for all poses writes
     } rows[] = {
-        {{0, 90, 0},     180.0},
-        {{0, -90, 0},    180.0},
-        {{30, 90, 40},   180.0},
-        {{-20, -90, 70}, 180.0},
-        {{5, 89.9f, 3},  0.0  },
-        {{5, 60, 3},     0.0  },
+        {{0, 90, 0}, 180.0},     {{0, -90, 0}, 180.0}, {{30, 90, 40}, 180.0},
+        {{-20, -90, 70}, 180.0}, {{5, 89.9f, 3}, 0.0}, {{5, 60, 3}, 0.0},
     };
     for (const auto& row : rows)
     {

@@ -88,9 +88,7 @@ TEST(HoldFoot, LongerFootRollsOverItsToeWhereTheSourceDoes)
         foot.Add({0.0f, 100.0f * std::sin(angle), -100.0f * std::cos(angle)}, up,
                  0.2f * static_cast<float>(frame));
     }
-    const std::vector<Vec3> path = foot.Hold({
-        {0, 60}
-    });
+    const std::vector<Vec3> path = foot.Hold({{0, 60}});
     const float ahead = foot.toe[0].z - foot.toe[59].z;
     for (size_t frame = 1; frame < 60; ++frame)
         EXPECT_NEAR(path[frame].z + foot.toe[frame].z, path[0].z + foot.toe[0].z,
@@ -105,9 +103,7 @@ TEST(HoldFoot, FreePathIsLeftForAContactAloneAndWithoutACorner)
     for (int frame = 0; frame < 240; ++frame)
         foot.Add(kVec3Zero, 0.0f,
                  frame >= 100 && frame < 140 ? 0.5f * static_cast<float>(frame - 120) : 0.0f);
-    const std::vector<Vec3> path = foot.Hold({
-        {100, 140}
-    });
+    const std::vector<Vec3> path = foot.Hold({{100, 140}});
     for (size_t frame = 101; frame < 140; ++frame)
         EXPECT_NEAR(path[frame].z, path[100].z, 0.05f) << frame;
     EXPECT_NEAR(path[100].z, 0.0f, 1.0f) << "in the middle of its free path";
@@ -124,8 +120,8 @@ TEST(HoldFoot, ShortDriftIsTakenAwayAndALongOneKept)
         float least;   // of what is kept of its way
         float largest; // the same
     } rows[] = {
-        {"a sensor's drift", 0.05f, 0.0f,  0.1f},
-        {"a dragged foot",   1.5f,  0.85f, 1.1f},
+        {"a sensor's drift", 0.05f, 0.0f, 0.1f},
+        {"a dragged foot", 1.5f, 0.85f, 1.1f},
     };
     for (const auto& row : rows)
     {
@@ -133,9 +129,7 @@ TEST(HoldFoot, ShortDriftIsTakenAwayAndALongOneKept)
         Foot foot;
         for (int frame = 0; frame < 120; ++frame)
             foot.Add({0.0f, 0.0f, row.step * static_cast<float>(frame)}, 0.0f, 0.0f);
-        const std::vector<Vec3> path = foot.Hold({
-            {0, 120}
-        });
+        const std::vector<Vec3> path = foot.Hold({{0, 120}});
         const float kept = (path[119].z - path[0].z) / (119.0f * row.step);
         EXPECT_GE(kept, row.least);
         EXPECT_LE(kept, row.largest);
@@ -190,10 +184,8 @@ TEST(YieldKnee, BentKneeReachesWhatIsAskedAndAStraightOneKeepsItsAngle)
         double reached; // of that, at the least
         double turned;  // degrees that the knee may turn
     } rows[] = {
-        {"bent, shorter",    60.0, -20.0, -18.0, 10.0},
-        {"bent, longer",     60.0, 20.0,  18.0,  10.0},
-        {"straight, noise",  2.0,  -0.3,  0.0,   1.0 },
-        {"straight, longer", 2.0,  30.0,  0.0,   2.1 },
+        {"bent, shorter", 60.0, -20.0, -18.0, 10.0},    {"bent, longer", 60.0, 20.0, 18.0, 10.0},
+        {"straight, noise", 2.0, -0.3, 0.0, 1.0},       {"straight, longer", 2.0, 30.0, 0.0, 2.1},
         {"out of all reach", 90.0, 900.0, 150.0, 90.0},
     };
     for (const auto& row : rows)

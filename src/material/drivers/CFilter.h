@@ -19,9 +19,8 @@ struct CFilter
     bool m_bUnitRange;   ///< values lie from 0 to 1
     /// Sets the client data from two parameters. Null if the function has no parameters.
     void (*init)(CFilter& filter, double first, double second);
-    void (*print)(const CFilter& filter); ///< null
-    std::shared_ptr<const void>
-        clientData; ///< second argument of the function; shared by copies
+    void (*print)(const CFilter& filter);   ///< null
+    std::shared_ptr<const void> clientData; ///< second argument of the function; shared by copies
 
     double operator()(double x) const { return function(x, clientData.get()); }
 };

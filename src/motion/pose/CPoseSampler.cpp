@@ -49,8 +49,7 @@ void CPoseSampler::Pose(double frame)
 {
     const auto time = static_cast<float>(frame / m_fFrequency);
     for (CNode* node : m_kNodes)
-        node->CSpatial::UpdateTransform(
-            time); // this node alone: UpdateScene would continue to its children
+        node->CSpatial::UpdateTransform(time); // this node alone: UpdateScene would continue to its children
 }
 
 Mat4 RestWorld(const CNode& node)
