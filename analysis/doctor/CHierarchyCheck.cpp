@@ -151,7 +151,8 @@ std::string CHierarchyCheck::ReadName(std::string_view name)
     for (std::string_view word = NextToken(name); !word.empty() && word.front() != '#';
          word = NextToken(name))
     {
-        joined = (joined + '_').append(word.substr(0, kNameLimit)).substr(0, kNameLimit);
+        joined.append(1, '_').append(word.substr(0, kNameLimit));
+        joined.resize(std::min(joined.size(), size_t{kNameLimit}));
         end = word.data() + word.size();
     }
     const std::string_view whole(first.data(), static_cast<size_t>(end - first.data()));

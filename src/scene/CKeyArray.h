@@ -84,7 +84,11 @@ public:
     }
 
 private:
-    static bool IsSame(const T& a, const T& b) { return std::memcmp(&a, &b, sizeof(T)) == 0; }
+    // By bytes: -0 and 0 are different keys, and a NaN equals itself. Keys are floats without gaps.
+    static bool IsSame(const T& a, const T& b)
+    {
+        return std::memcmp(&a, &b, sizeof(T)) == 0; // NOLINT(bugprone-suspicious-memory-comparison)
+    }
 
     std::vector<T> m_kStored; // empty, one key for all, or all keys
     size_t m_uiSize = 0;

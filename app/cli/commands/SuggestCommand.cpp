@@ -46,10 +46,10 @@ const char* Text(const char* const (&words)[count], Enum value)
 // "left upper arm"
 std::string PlaceWords(BodyPlace place)
 {
-    const std::string joint = Text(kJointWords, place.joint);
+    const char* const joint = Text(kJointWords, place.joint);
     if (!HasSides(place.joint))
         return joint;
-    return (place.side == EBodySide::Left ? "left " : "right ") + joint;
+    return std::string(place.side == EBodySide::Left ? "left " : "right ") + joint;
 }
 
 std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
