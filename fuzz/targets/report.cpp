@@ -26,7 +26,7 @@ std::string Written(const std::vector<Notice>& notices)
         json.EndObject();
     }
     std::fclose(file);
-    const std::string written(text, size);
+    std::string written(text, size);
     std::free(text);
     return written;
 }

@@ -23,8 +23,12 @@ constexpr double kLeastRowBytes = 7 * 9 + 1;
 double NumberBytes(double rowCount)
 {
     double bytes = 0.0;
-    for (double first = 1.0; first <= rowCount; first *= 10.0)
+    double first = 1.0;
+    while (first <= rowCount)
+    {
         bytes += rowCount - first + 1.0; // all rows from here on have one more digit
+        first *= 10.0;
+    }
     return bytes;
 }
 
