@@ -1,24 +1,10 @@
 #include "FindPlants.h"
 
 #include "CFeetTrack.h"
-#include "Figures.h"
 
-#include <algorithm>
-#include <iterator>
+#include <span>
 
 namespace gw {
-
-namespace {
-
-float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const)
-{
-    std::vector<float> heights;
-    for (const CLegTrack& leg : legs)
-        std::ranges::transform((leg.*joint)(), std::back_inserter(heights), &Vec3::y);
-    return Percentile(std::move(heights), kFloorShare);
-}
-
-} // namespace
 
 std::vector<FootPlants> FindPlants(const CFeetTrack& feet, double secondsPerFrame)
 {

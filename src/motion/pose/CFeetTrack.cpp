@@ -15,7 +15,8 @@ namespace {
 constexpr double kLowHeight = 0.02;
 constexpr double kHoverHeight = 0.05;
 
-// The height on which a joint of all feet stands.
+} // namespace
+
 float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const)
 {
     std::vector<float> heights;
@@ -23,8 +24,6 @@ float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLeg
         std::ranges::transform((leg.*joint)(), std::back_inserter(heights), &Vec3::y);
     return Percentile(std::move(heights), kFloorShare);
 }
-
-} // namespace
 
 CFeetTrack::CFeetTrack(const std::vector<LegJoints>& legs)
 {

@@ -20,6 +20,9 @@ struct FootTouches
     std::vector<float> landed;
 };
 
+/// Returns the height at which a joint, `Ankles` or `Toes`, of all legs stands on the floor.
+float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const);
+
 /// The feet of one skeleton while frames go by.
 class CFeetTrack
 {
