@@ -34,10 +34,6 @@ function(gw_compile_options target)
             -Wconversion
             -Wnon-virtual-dtor
             -Woverloaded-virtual)
-  if(GAITWRIGHT_UNITY)
-    # To the compiler, a source that another one includes is a header, where types of unnamed namespaces are suspect.
-    target_compile_options(${target} PRIVATE -Wno-subobject-linkage)
-  endif()
   if(NOT GAITWRIGHT_SANITIZE AND NOT GAITWRIGHT_FUZZ)
     gw_harden(${target})
   endif()
@@ -52,6 +48,15 @@ function(gw_compile_options target)
   endif()
 endfunction()
 
+# Compiles a target's sources eight at a time, if the preset says so. To the compiler, a source that another one
+# includes is a header, where types of unnamed namespaces are suspect.
+function(gw_join_sources target)
+  if(GAITWRIGHT_UNITY)
+    set_target_properties(${target} PROPERTIES UNITY_BUILD ON UNITY_BUILD_BATCH_SIZE 8)
+    target_compile_options(${target} PRIVATE -Wno-subobject-linkage)
+  endif()
+endfunction()
+
 # gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the current folder.
 function(gw_room name)
   cmake_parse_arguments(ROOM "" "" "PUBLIC;PRIVATE" ${ARGN})
@@ -61,7 +66,8 @@ function(gw_room name)
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
   target_link_libraries(${name} PUBLIC ${ROOM_PUBLIC} PRIVATE ${ROOM_PRIVATE})
   target_compile_features(${name} PUBLIC cxx_std_20)
-  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON UNITY_BUILD ${GAITWRIGHT_UNITY} UNITY_BUILD_BATCH_SIZE 8)
+  set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
+  gw_join_sources(${name})
   gw_compile_options(${name})
 endfunction()
 
