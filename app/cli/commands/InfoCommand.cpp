@@ -30,7 +30,7 @@ struct Timing
     float Seconds() const { return lastFrame * frameSeconds; }
 };
 
-Timing TimingOf(const CKeyframeControl* track)
+Timing TrackTiming(const CKeyframeControl* track)
 {
     if (!track)
         return {};
@@ -98,7 +98,7 @@ void Print(const std::string& path, CSceneFile& file)
     std::printf("file:    %s\nformat:  %s\n", Printable(path).c_str(), FormatOf(path, file).c_str());
     if (file.IsContainer())
         PrintContainer(file.Scene());
-    const Timing timing = TimingOf(file.FirstTrack());
+    const Timing timing = TrackTiming(file.FirstTrack());
     if (!file.IsContainer() || timing.frames != 0)
         PrintTiming(timing);
     PrintBones(file.Nodes());
@@ -112,7 +112,7 @@ void WriteJson(const std::string& path, CSceneFile& file)
     json.BeginObject();
     json.Key("file").Text(path);
     json.Key("format").Text(FormatOf(path, file));
-    WriteTiming(json, TimingOf(file.FirstTrack()));
+    WriteTiming(json, TrackTiming(file.FirstTrack()));
     WriteBones(json, file.Nodes());
     WriteRecord(json, path, file.Record());
     if (file.IsContainer())
