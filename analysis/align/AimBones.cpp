@@ -25,9 +25,9 @@ private:
     struct Row
     {
         CNode* target;
-        CNode* source; ///< of the original motion; null if there is none
+        CNode* source; ///< joint of the original motion; null if there is none
         bool fixed;
-        Mat3 turn = kMat3Identity; ///< rotation at rest, relative to the source's
+        Mat3 turn = kMat3Identity; ///< rotation at rest, relative to the source's rotation
     };
 
     Row* RowOf(const char* target);
@@ -77,7 +77,8 @@ bool CBoneAimer::LiesInTrunk(const CNode* source) const
     return found != m_kIndex.end() && alignment_.joints[found->second].axis == kVec3UnitY;
 }
 
-// A collar's rotation says nothing about the torso that the torso's own would not say better.
+// Drives torso and waist by the spine if the torso's source is outside the trunk. The rotation of a collar,
+// for example, shows less about the torso than the spine's own rotation.
 void CBoneAimer::TakeSpine()
 {
     const std::vector<CNode*>& spine = source_.body.spine;
@@ -90,7 +91,8 @@ void CBoneAimer::TakeSpine()
     waist->source = spine.size() > 1 ? spine[(spine.size() - 1) / 2] : nullptr;
 }
 
-// Without this, a collar would share the upper arm's rotation, from a frame across its own.
+// Makes collars without a source follow the torso. Otherwise, a collar would share the rotation of the upper
+// arm, whose frame is at an angle to its own.
 void CBoneAimer::TakeCollars()
 {
     const Row* const torso = RowOf(kTorsoBone);
@@ -102,7 +104,8 @@ void CBoneAimer::TakeCollars()
     }
 }
 
-// Legs are attached to the pelvis, whose direction can differ from that of the bone from hip to spine.
+// Makes hip bones without a source follow the pelvis, to which the legs are attached. Its direction can
+// differ from that of the bone between hip and spine.
 void CBoneAimer::TakePelvis()
 {
     for (const HostSide& side : kHostSides)

@@ -9,14 +9,14 @@ struct BodyMotion;
 struct Alignment;
 struct AlignedMotion;
 
-/// Lets the hands that a body has drive those of the target that no row of the map drives or fixes.
+/// Makes the body's hands drive those hands of the target that no row of the bone map drives or fixes.
 void DriveHands(CRetargeter& table, CNode& targetRoot, const CBodyMap& body);
 
-/// Hands a retargeter, filled for the source, over to the aligned motion. Every target bone that a row drives
-/// points as its source does: offsets become what takes the source's aligned rest pose to the target's, and
-/// those of the rows, which were made against another rest pose, are set aside. A torso that is driven from
-/// beside the spine takes the spine's joints instead; a collar without a source goes along with the torso,
-/// and hip bones with the pelvis, however the hip's bone leans from it.
+/// Switches a retargeter that was set up for the source to the aligned motion. Every target bone with a
+/// source then points in the direction of its source. The rows' offsets, which were made for a different rest
+/// pose, are replaced by the rotations from the source's aligned rest pose to the target's. If the torso is
+/// driven by a joint outside the spine, it is driven by the spine instead. A collar without a source follows
+/// the torso, and hip bones without a source follow the pelvis, whatever the lean of the hip's own bone.
 void AimBones(CRetargeter& table, CNode& targetRoot, const BodyMotion& source, const Alignment& alignment,
               const AlignedMotion& aligned);
 

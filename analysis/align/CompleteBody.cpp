@@ -7,7 +7,8 @@ namespace gw {
 
 namespace {
 
-// Returns the child joint that is farthest away at rest: a forearm's hand instead of its twist joints.
+// Returns the child joint that is farthest away at rest: for a forearm, the hand instead of a twist joint.
+// Returns null if there is none.
 CNode* FarthestChild(const CNode* joint)
 {
     CNode* farthest = nullptr;

@@ -6,16 +6,16 @@
 
 namespace gw {
 
-/// What an alignment corrects in a motion.
+/// The kinds of problems that an alignment corrects.
 enum class ECorrection : uint8_t
 {
-    RestPose,         ///< a bone that is off its direction in a T-pose, by `degrees`
-    UpAxis,           ///< an up axis that is not Y; `joint` is its name: "Z", "-Y"
-    BoneFrames,       ///< a frame that a slanted offset turns about its bone, by `degrees`
-    DoubledPositions, ///< positions that repeat the joint's offset, which doubles its bone
+    RestPose,         ///< a bone is off its T-pose direction by `degrees`
+    UpAxis,           ///< the up axis is not Y; `joint` is the axis name, such as "Z" or "-Y"
+    BoneFrames,       ///< a slanted offset twists the frame about its bone by `degrees`
+    DoubledPositions, ///< positions repeat the joint's offset, which doubles its bone
 };
 
-/// One thing that an alignment corrects.
+/// One correction of a motion.
 struct Correction
 {
     ECorrection kind;
@@ -23,11 +23,11 @@ struct Correction
     double degrees = 0.0;
 };
 
-/// What an alignment corrects in one motion.
+/// All corrections of one motion.
 struct Corrections
 {
     std::vector<Correction> list;
-    /// The frame whose pose shows how the bones are turned, or -1 if the zero pose does.
+    /// The frame whose pose shows how the bones are oriented, or -1 if the zero pose does.
     int referenceFrame = -1;
 };
 

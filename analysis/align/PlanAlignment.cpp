@@ -42,7 +42,8 @@ void AddDoubled(const std::vector<CNode*>& joints, const std::vector<bool>& doub
     }
 }
 
-// Joints of the trunk that stand where the next one stands: they turn nothing but what is above that.
+// Finds the joints of the trunk that coincide with the next joint. For each, the bone goes to the first joint
+// farther up that does not coincide with it.
 std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<JointRole>& roles, double leg)
 {
     const auto isApart = [leg](const CNode* a, const CNode* b) {
@@ -63,7 +64,8 @@ std::vector<LooseWay> FindLooseWays(const CTreePoser& tree, const std::vector<Jo
     return ways;
 }
 
-// Whether the motion puts a joint elsewhere than its offset does, as seen from the joint above.
+// Returns whether the motion moves a joint to a different direction from its parent than its offset has.
+// Checks the first, middle and last key.
 bool IsMoved(const CNode& joint)
 {
     constexpr double kSameWay = 0.5; // degrees
@@ -78,7 +80,7 @@ bool IsMoved(const CNode& joint)
     });
 }
 
-// Limbs of which the motion moves the joint at the end: their bones lie where it is on the whole.
+// Adds the limbs whose end joint is moved by the motion. Their bones point to that joint's mean position.
 void AddMovedLimbs(const CTreePoser& tree, const std::vector<JointRole>& roles, std::vector<LooseWay>& ways)
 {
     for (size_t i = 0; i < roles.size(); ++i)
@@ -103,7 +105,7 @@ bool IsFinite(const std::vector<Mat3>& turns)
     return true;
 }
 
-// Helpers between two joints of the body bear the lower one.
+// Marks helper joints that have a joint of the body below them.
 void MarkBearers(std::vector<JointAlignment>& joints)
 {
     for (auto joint = joints.rbegin(); joint != joints.rend(); ++joint)
@@ -113,7 +115,7 @@ void MarkBearers(std::vector<JointAlignment>& joints)
     }
 }
 
-// One planning of one motion, step by step.
+// Plans the alignment of one motion, step by step.
 class CAlignmentPlanner
 {
 public:
@@ -136,8 +138,8 @@ private:
     std::vector<JointRole> m_kRoles;
     std::vector<LooseWay> m_kWays;
     std::vector<bool> m_kDoubled;
-    bool m_bIsRest = false;  // the zero pose tells how bones are turned
-    Vec3 m_kUp = kVec3UnitY; // of the pose that does
+    bool m_bIsRest = false;  // the zero pose shows how the bones are oriented
+    Vec3 m_kUp = kVec3UnitY; // up axis of the pose that shows it
 };
 
 void CAlignmentPlanner::LookAtRest()

@@ -16,10 +16,11 @@ namespace gw {
 
 namespace {
 
-// in degrees: the maximum angle of a limb from its axis, or of its frame's twist
+// In degrees: the largest angle between a limb and its axis, and the largest twist of its frame, that are not
+// reported.
 constexpr double kOffAxis = 30.0;
 
-// Returns the twist of a bone's frame, compared with one that is only swung from an axis.
+// Returns the twist of a bone's frame in degrees, relative to a frame that is only swung away from an axis.
 double FrameTwist(const CNode& joint)
 {
     CBoneMesh* const mesh = FindBoneMesh(joint);

@@ -10,8 +10,8 @@ namespace gw {
 
 namespace {
 
-// Up to the first height over its floor, in leg lengths, a joint that stands has its sole on the floor; from
-// the second on it hovers.
+// Heights of a standing joint above its floor, in leg lengths. Up to the first, its sole is on the floor;
+// from the second on, it hovers.
 constexpr double kLowHeight = 0.02;
 constexpr double kHoverHeight = 0.05;
 

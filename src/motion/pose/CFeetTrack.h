@@ -9,41 +9,44 @@ namespace gw {
 
 class CPoseSampler;
 
-/// The touches of one foot.
+/// When one foot touches the floor.
 struct FootTouches
 {
-    /// Frames in which the ankle or the toe stands, whatever the other does: a heel that has come down, a
-    /// ball that pushes off.
+    /// Frames in which the ankle or the toe stands, whatever the other does: for example, a heel that has
+    /// come down or a ball that pushes off.
     std::vector<Contact> contacts;
-    /// How surely the sole is on the floor, 0 to 1, frame by frame: 1 where ankle and toe stand together;
-    /// less where one alone does and hovers.
+    /// Confidence, 0 to 1, that the sole is on the floor; one value per frame. It is 1 in a contact in which
+    /// ankle and toe stand together, less if only one stands and hovers, and 0 outside of contacts.
     std::vector<float> landed;
 };
 
 /// Returns the height at which a joint, `Ankles` or `Toes`, of all legs stands on the floor.
 float FloorOf(const std::vector<CLegTrack>& legs, const std::vector<Vec3>& (CLegTrack::*joint)() const);
 
-/// The feet of one skeleton while frames go by.
+/// Records the feet of one skeleton, frame by frame.
 class CFeetTrack
 {
 public:
+    /// The tree may be in any pose; the floor is found from the rest pose.
     explicit CFeetTrack(const std::vector<LegJoints>& legs);
 
+    /// Makes a sampler pose the joints of the legs.
     void WatchJoints(CPoseSampler& sampler) const;
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Append();
-    /// The same for ankles and toes alone: what contacts are found by.
+    /// Adds only the positions of ankles and toes as the next frame. Contacts need nothing else.
     void AppendPlaces();
-    /// Takes the present pose for how long the legs are.
+    /// Measures the length of the legs in the current pose.
     void MeasureLegs();
 
     std::vector<CLegTrack>& Legs() { return m_kLegs; }
     const std::vector<CLegTrack>& Legs() const { return m_kLegs; }
-    /// The legs' mean length, or 0 without legs.
+    /// Returns the mean length of the legs, in the skeleton's units; 0 without legs or before MeasureLegs.
     double LegLength() const { return m_fLegLength; }
-    /// The contacts of each leg.
+    /// Returns the contacts of each leg: frames in which ankle and toe stand together. The legs must have
+    /// been measured.
     std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
-    /// What each leg touches the floor with.
+    /// Returns when each leg touches the floor. The legs must have been measured.
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:

@@ -86,8 +86,8 @@ double RestFloor(const std::vector<LegJoints>& legs)
         lowest = i == 0 ? height : std::min(lowest, height);
         calf = std::max(calf, Vec3Length(ankle - RestWorld(*legs[i].knee).Translation()));
     }
-    // An ankle is a fifth of the calf above the sole; a skeleton whose hip is the origin hangs two calves
-    // below it.
+    // An ankle is about a fifth of the calf's length above the sole. The feet of a skeleton whose hip is at
+    // the origin are about two calf lengths below it.
     const bool stands = lowest >= 0.0 && lowest < 0.5 * calf;
     return stands ? 0.0 : lowest;
 }

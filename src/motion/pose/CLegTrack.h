@@ -15,42 +15,45 @@ struct LegJoints
     CNode* thigh = nullptr;
     CNode* knee = nullptr;
     CNode* ankle = nullptr;
-    CNode* toe = nullptr; ///< null where the foot has no joint below
+    CNode* toe = nullptr; ///< null if the foot has no joint below it
 };
 
-/// What one leg of one skeleton does, frame by frame: what can only be judged when all frames are known.
+/// Records one leg of a skeleton, frame by frame, for checks that need all frames.
 class CLegTrack
 {
 public:
-    /// A frame's place and posture. World space; unit vectors; degrees.
+    /// The posture of the leg in one frame. Vectors are in world space and normalized; angles are in degrees.
     struct Posture
     {
-        Vec3 heading;     ///< of the foot, from ankle to toe
-        float soleTilt;   ///< between the sole's normal and y
+        Vec3 heading;     ///< direction of the foot, from ankle to toe
+        float soleTilt;   ///< angle between the sole's normal and y
         float soleHeight; ///< y of the sole's lower end
-        float kneeAngle;  ///< between thigh and calf, 0 for a straight leg
+        float kneeAngle;  ///< angle between thigh and calf; 0 for a straight leg
     };
 
-    /// The tree is posed somehow; in its rest pose the soles lie on the height `restFloor`.
+    /// The tree may be in any pose. In its rest pose, the soles are at the height `restFloor`.
     CLegTrack(const LegJoints& joints, double restFloor);
 
+    /// Makes a sampler pose the joints of the leg.
     void WatchJoints(CPoseSampler& sampler) const;
     bool HasToe() const { return m_kJoints.toe != nullptr; }
-    /// Thigh to knee to ankle, as posed.
+    /// Returns the length from thigh to knee to ankle in the current pose.
     double Length() const;
-    /// The ankle above the sole in the rest pose; 0 for a skeleton that ends at its ankles.
+    /// Returns the height of the ankle above the sole in the rest pose; 0 for a skeleton that ends at its
+    /// ankles.
     double AnkleHeight() const;
-    /// Where the foot points, as posed.
+    /// Returns the unit direction of the foot in the current pose, in world space.
     Vec3 Heading() const;
-    /// Lets a foot without a toe joint point from now on as it would have to be pointing now.
+    /// Defines where a foot without a toe joint points: in the current pose, in `direction` (world space).
     void SetHeading(const Vec3& direction);
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Append();
-    /// The same without a posture.
+    /// Adds only the positions of ankle and toe as the next frame, without a posture.
     void AppendPlaces();
 
+    /// Returns the world position of the ankle, one per frame.
     const std::vector<Vec3>& Ankles() const { return m_kAnkles; }
-    /// One a frame; none for a foot without a toe joint.
+    /// Returns the world position of the toe, one per frame; empty for a foot without a toe joint.
     const std::vector<Vec3>& Toes() const { return m_kToes; }
     const std::vector<Posture>& Postures() const { return m_kPostures; }
 
@@ -59,19 +62,19 @@ private:
 
     LegJoints m_kJoints;
     Vec3 m_kHeelSole;             // in the ankle's space
-    Vec3 m_kToeSole = kVec3Zero;  // in the toe's
-    Vec3 m_kSoleNormal;           // in the ankle's
-    Vec3 m_kHeading = kVec3UnitZ; // in the ankle's, for a foot without a toe joint
+    Vec3 m_kToeSole = kVec3Zero;  // in the toe's space
+    Vec3 m_kSoleNormal;           // in the ankle's space
+    Vec3 m_kHeading = kVec3UnitZ; // in the ankle's space, for a foot without a toe joint
     std::vector<Vec3> m_kAnkles;
     std::vector<Vec3> m_kToes;
     std::vector<Posture> m_kPostures;
 };
 
-/// What lies on the floor under a joint in the rest pose, in the joint's space.
+/// Returns the point of the floor directly below a joint in the rest pose, in the joint's space.
 Vec3 SoleUnder(const CNode& joint, double restFloor);
 
-/// The height on which a skeleton stands in its rest pose: y = 0 where its feet are at or little above it,
-/// else that of the lowest ankle or toe.
+/// Returns the height of the floor in the rest pose: 0 if the lowest ankle or toe is at y = 0 or slightly
+/// above it, otherwise the height of that joint.
 double RestFloor(const std::vector<LegJoints>& legs);
 
 } // namespace gw

@@ -10,8 +10,8 @@
 
 namespace gw {
 
-/// Mean and maximum of a sequence of numbers; both are 0 for an empty one. Infinities and NaN, as they result
-/// from positions near the limits of a float, are ignored.
+/// Mean and maximum of a sequence of numbers; both are 0 for an empty sequence. Infinities and NaN, which
+/// result from positions near the limits of a float, are ignored.
 class CRunningMean
 {
 public:
@@ -34,26 +34,26 @@ private:
     size_t m_uiCount = 0;
 };
 
-/// result / source; empty if the source's value is not above `least`, the largest value that rounding can
-/// make of 0.
+/// Returns `result` / `source`, or nothing if `source` is not above `least`, the largest value to which
+/// rounding can turn 0.
 inline std::optional<double> RatioOf(double result, double source, double least = 0.0)
 {
     return source > least ? std::optional(result / source) : std::nullopt;
 }
 
-/// 0 at and below 0, 1 at and above 1, and smooth in between.
+/// Returns 0 for x <= 0, 1 for x >= 1, and a smooth transition in between: 3 x^2 - 2 x^3.
 double Smoothstep(double x);
 
-/// The nearest-rank percentile: the value below which a share (0 to 1) of the values lies. 0 if there are no
-/// values. Values that are not finite are ignored.
+/// Returns the nearest-rank percentile: the value below which a share (0 to 1) of the values lies. Non-finite
+/// values are ignored. Returns 0 if there are no values.
 float Percentile(std::vector<float> values, double share);
 
-/// The horizontal part of a way: in x and z only.
+/// Returns the horizontal part of a vector: x and z, with y = 0.
 inline Vec3 OverGround(const Vec3& way)
 {
     return {way.x, 0.0f, way.z};
 }
-/// The horizontal distance of two points: in x and z only.
+/// Returns the horizontal distance between two points, in x and z only.
 double GroundDistance(const Vec3& a, const Vec3& b);
 
 } // namespace gw

@@ -1,3 +1,10 @@
+// A planted foot is recognized by two things at once: its joints are close to their floors, and they hardly
+// move. Either alone is not enough, because a swinging foot passes low over the floor and a raised foot may
+// be held still. Recordings are noisy, so there are two pairs of thresholds: a strict one to start a contact
+// and a looser one to end it. The speed of a frame is the lower of the speeds before and after it. So the
+// frames in which a foot lands and lifts off belong to the contact. Finally, touches that are too short are
+// dropped.
+
 #include "FindContacts.h"
 
 #include <algorithm>
@@ -7,7 +14,7 @@ namespace gw {
 
 namespace {
 
-// How high and how fast the joints of a foot are at most.
+// Checks how high and how fast the joints of a foot are in a frame.
 class CFootState
 {
 public:
@@ -35,7 +42,8 @@ private:
     {
         return Vec3Length(At(joint, to) - At(joint, from)) / (m_fSecondsPerFrame * (to - from));
     }
-    // The slower of before and after: the first and the last frame of a stand belong to it.
+    // Returns the lower of the speeds before and after the frame, so a contact includes its first and last
+    // frame.
     double Speed(const FloorPath& joint, int frame) const
     {
         const int before = std::max(frame - m_iSpan, 0);

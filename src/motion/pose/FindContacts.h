@@ -7,28 +7,28 @@
 
 namespace gw {
 
-// A foot begins to stand when it is lower and slower than the first figure of each row, and goes on until it
-// is higher or faster than the second; in between it does what it did, so that noise at a threshold makes no
-// new contact. Heights are leg lengths above the floor, speeds leg lengths a second; a leg is about 85 cm.
-inline constexpr double kStandHeight =
-    0.06;                                   ///< 5 cm: carpets, soft floors, a sensor that slipped on the shoe
-inline constexpr double kLeaveHeight = 0.1; ///< 9 cm: half of what an ankle rises in a step
-inline constexpr double kStandSpeed = 0.35; ///< 30 cm/s: a tenth of a walking foot's swing
-inline constexpr double kLeaveSpeed =
-    0.6; ///< 50 cm/s: a heel that peels off is faster within a fiftieth of a second
-/// Speeds are taken over this many seconds, so that jitter of a fast recording is no speed.
+// A foot starts to stand when it is below kStandHeight and slower than kStandSpeed, and stands until it is
+// above kLeaveHeight or faster than kLeaveSpeed. In between, it keeps its state, so noise at a threshold does
+// not start a new contact. Heights are in leg lengths above the floor, speeds in leg lengths per second; a
+// leg is about 85 cm.
+inline constexpr double kStandHeight = 0.06; ///< 5 cm: allows for carpets, soft floors, a sensor that slipped
+inline constexpr double kLeaveHeight = 0.1;  ///< 9 cm: half the rise of an ankle in a step
+inline constexpr double kStandSpeed = 0.35;  ///< 30 cm/s: a tenth of a walking foot's swing speed
+inline constexpr double kLeaveSpeed = 0.6;   ///< 50 cm/s: a heel that peels off exceeds it within 1/50 s
+/// Speeds are measured over this many seconds, so jitter in recordings with a high frame rate is not taken
+/// for speed.
 inline constexpr double kSpeedSeconds = 1.0 / 30.0;
-/// A shorter touch is a foot that brushes the floor: sprinters stand for 0.09 s.
+/// Shorter touches are ignored: the foot only brushes the floor. Sprinters stand for 0.09 s.
 inline constexpr double kLeastContactSeconds = 0.08;
-/// The floor of a joint is this percentile of its heights, both feet taken together: low enough to be one at
-/// which it stands in nearly any motion, high enough for an outlier not to count.
+/// The floor of a joint is this percentile of its heights, as a share, over both feet together. It is low
+/// enough to be a height at which the joint stands in nearly any motion, and high enough to ignore outliers.
 inline constexpr double kFloorShare = 0.05;
 
-/// Frames of one foot on the ground.
+/// A range of frames in which one foot is on the ground.
 struct Contact
 {
-    int first; ///< first frame that stands
-    int end;   ///< first frame that does not
+    int first; ///< first frame in which the foot stands
+    int end;   ///< first frame in which it no longer does
 };
 
 /// A joint's world positions, frame by frame, and the height at which it stands.
@@ -38,11 +38,12 @@ struct FloorPath
     float floor;
 };
 
-/// The contacts of a foot whose joints (ankle, toe) have to be low and slow together. All paths are of one
-/// length. `leg` is in the unit of the positions and above 0.
+/// Returns the contacts of a foot, in order: the frames in which all its joints (ankle, toe) are low and slow
+/// at the same time. All paths must have the same number of frames. `leg` is the leg's length in the unit of
+/// the positions and must be above 0.
 std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg, double secondsPerFrame);
 
-/// The frames of two lists of contacts together, in order; contacts that meet or overlap become one.
+/// Returns the union of two lists of contacts, in order. Contacts that meet or overlap are merged.
 std::vector<Contact> MergedContacts(std::vector<Contact> contacts, const std::vector<Contact>& more);
 
 } // namespace gw

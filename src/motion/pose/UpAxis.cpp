@@ -1,7 +1,8 @@
-// A file does not say which of its axes is up. Its rest pose may, if it is a stance, but the motion may be
-// turned against it. The trunk's mean direction over the motion does, if the body stands on the whole. A body
-// that is upside down for part of the motion, as in a cartwheel, has a short mean; then the frames decide in
-// which trunk and legs stand along one axis, if next to none do so along +Y.
+// A file does not state which of its axes is up. The rest pose may show it, if it is a standing pose, but the
+// motion may be rotated relative to it. The trunk's mean direction over the motion shows it if the body
+// stands most of the time. If the body is upside down for part of the motion, as in a cartwheel, that mean is
+// short. Then the frames decide in which both trunk and legs are along one axis, provided that few are along
+// +Y.
 
 #include "UpAxis.h"
 
@@ -21,15 +22,16 @@ namespace gw {
 namespace {
 
 constexpr int kSamples = 64;
-// Cosine of the angle by which the trunk's mean direction may lean from the axis; a mean over figures that
-// tumble is shorter.
+// Minimum component of the trunk's mean direction along the axis: the cosine of the largest lean. If the body
+// tumbles, the mean is shorter than a unit vector and fails this too.
 constexpr double kUpright = 0.8;
-// The same for trunk and legs of a motion whose zero pose stands along Y, and how far from height 0, in leg
-// lengths, its feet may be on the whole: who lies on the ground does not stand on the origin's plane.
+// Stricter limits for a motion whose zero pose stands along Y: the same minimum, for trunk and legs, and the
+// largest distance of the mean foot position from height 0, in leg lengths. The feet of a body that lies on
+// the ground are not near the plane through the origin.
 constexpr double kSurelyUpright = 0.9;
 constexpr double kNearFloor = 0.25;
-// Of the frames, how many stand along the axis of a body that tumbles; and how many times as many as along
-// +Y.
+// For a body that tumbles: the minimum share of frames that stand along the axis, and how many times as many
+// they must be as those along +Y.
 constexpr double kTumblingShare = 0.2;
 constexpr double kTumblingMore = 3.0;
 
@@ -39,12 +41,12 @@ constexpr Vec3 kAxes[] = {
      kVec3UnitX, {-1.0f, 0.0f,  0.0f },
 };
 
-/// What a pose shows of the up axis, or the mean of several.
+/// What a pose shows about the up axis, or the mean over several poses.
 struct Bearing
 {
-    Vec3 trunk = kVec3Zero; ///< unit vector
-    Vec3 legs = kVec3Zero;  ///< the mean of unit vectors from ankle to thigh
-    Vec3 feet = kVec3Zero;  ///< their middle, in leg lengths
+    Vec3 trunk = kVec3Zero; ///< unit vector; shorter in a mean
+    Vec3 legs = kVec3Zero;  ///< mean of the unit vectors from ankle to thigh
+    Vec3 feet = kVec3Zero;  ///< midpoint of the feet, in leg lengths
 };
 
 Bearing BearingOf(const CBodyMap& body)
@@ -59,7 +61,7 @@ Bearing BearingOf(const CBodyMap& body)
         bearing.legs = bearing.legs + Vec3Normalized(WayTo(foot, side.thigh)) * 0.5f;
         bearing.feet = bearing.feet + PlaceOf(*foot) * (0.5f / static_cast<float>(leg));
     }
-    if (bearing.trunk == kVec3Zero) // a body of legs
+    if (bearing.trunk == kVec3Zero) // a body that consists of legs only
         bearing.trunk = Vec3Normalized(bearing.legs);
     return bearing;
 }
@@ -113,8 +115,9 @@ bool StandsAlong(const Vec3& axis, const Bearing& bearing)
     return HasTrunkAlong(axis, bearing) && Vec3Dot(axis, bearing.legs) >= kUpright;
 }
 
-// The axis of a body that stands along one for part of the motion, and is tumbling for the rest. A rest pose
-// that stands along it too is evidence enough; without one the feet have to be on the floor.
+// Returns the up axis of a body that stands along one axis for part of the motion and tumbles for the rest. A
+// rest pose that stands along the same axis is enough evidence; otherwise the feet must be on the floor.
+// Returns +Y if there is not enough evidence.
 Vec3 FindAxisOfTumbling(const std::vector<Bearing>& bearings, const Vec3& restUp)
 {
     const auto countAlong = [&](const Vec3& axis) {

@@ -5,9 +5,9 @@
 
 namespace gw {
 
-/// The world axis, plus or minus, along which a motion's body stands: told by its rest pose and by the whole
-/// motion together. +Y where nothing says otherwise. `frequency` is seconds from frame to frame. Poses the
-/// tree on the way.
+/// Returns the world axis that is up in a motion, as a positive or negative unit vector. The rest pose and
+/// the whole motion are both considered; the result is +Y unless they show otherwise. `frequency` is the time
+/// between frames in seconds. The tree's pose is changed.
 Vec3 FindUpAxis(const CBodyMap& body, float frequency, int frameCount);
 
 } // namespace gw

@@ -1,7 +1,7 @@
 // Computes the scale from source to target as the ratio of hip height plus leg length. Two walkers climb from
-// both feet toward the hips; the left one measures the leg, and the middle between them is the pelvis. The
-// ratio is then corrected by how far the target's proportions are from the usual ones, which differ between
-// legs with and without extra joints.
+// both feet toward the hips; the left one measures the leg, and the midpoint between the two is the pelvis.
+// The ratio is then corrected for the difference between the target's proportions and the usual ones, which
+// are not the same for legs with and without extra joints.
 
 #include "CRetargeter.h"
 #include "HostBones.h"
@@ -13,7 +13,7 @@ namespace gw {
 
 namespace {
 
-// Normal proportions of the target family, and the cost of deviating from them.
+// Usual proportions of the target family, and the correction factor for deviating from them.
 constexpr float kLongNorm = 8.5f;
 constexpr float kLongBend = 0.0075f;
 constexpr float kShortNorm = 5.1f;
@@ -26,7 +26,7 @@ double SecondRowLength(const CSpatial* node)
     return node ? Vec3Length(node->m_kWorldMatrix.Row(1)) : 1.0;
 }
 
-// Counts the links of a target leg, without the first step up from the foot's parent.
+// Counts the links of a target leg from the foot's parent up to, but not including, the pelvis bone or root.
 int TargetLinks(const CNode* foot)
 {
     int links = 0;
@@ -39,6 +39,7 @@ int TargetLinks(const CNode* foot)
     return links;
 }
 
+// Counts the links of a source leg from the foot up to, but not including, the thigh.
 int SourceLinks(const CNode* foot, const CNode* thigh)
 {
     int links = 1;

@@ -1,10 +1,10 @@
-// The sum of squares has its least where its derivatives vanish, which is one linear equation a frame. A
-// frame's equation contains the two frames before and the two after it: the matrix is symmetric, positive
+// The sum of squares is smallest where its derivatives vanish, which gives one linear equation per frame. A
+// frame's equation involves the two frames before and the two after it, so the matrix is symmetric, positive
 // definite and has five diagonals. It is factored as L · D · transpose(L) from the top down (Golub and Van
-// Loan, Matrix Computations, banded Cholesky), with no choice of pivots and without a square root.
+// Loan, Matrix Computations, banded Cholesky), without pivoting and without square roots.
 //
-// For a curve asked for everywhere with weight 1, a bend of b multiplies what swings with w radians a frame
-// by 1 / (1 + b w^4): BendWeight is the b at which that is a half.
+// If every frame has a request with weight 1, a bend weight of b scales an oscillation of w radians per frame
+// by 1 / (1 + b w^4). BendWeight returns the b for which that is one half.
 
 #include "CBandFit.h"
 
@@ -51,7 +51,7 @@ void CBandFit::AddStep(size_t frame, double weight, double wanted)
     m_kWanted[frame + 1] += weight * wanted;
 }
 
-// Leaves D in the diagonal and the two diagonals of L below it in the others.
+// Stores D in m_kDiagonal and the two diagonals of L below it in the other two.
 void CBandFit::Factor()
 {
     for (size_t frame = 0; frame < m_kDiagonal.size(); ++frame)

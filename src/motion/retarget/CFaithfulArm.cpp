@@ -14,7 +14,8 @@ namespace gw {
 
 namespace {
 
-// Of the elbow's usual side, for an arm that is straight; a bent one stands ten times farther off.
+// How much the elbow's usual side counts, in millimeters. It decides for a straight arm; the elbow of a bent
+// one is ten times farther from the line.
 constexpr float kUsualSide = 5.0f;
 
 Vec3 PlaceOfBone(const CPoseMatcher& matcher, size_t bone)
@@ -50,7 +51,7 @@ std::optional<CFaithfulArm> CFaithfulArm::Plan(const CRetargeter& retargeter, co
     return arm;
 }
 
-// Where the elbow stands off the line from shoulder to hand.
+// Returns the elbow's offset from the line between shoulder and hand.
 Vec3 CFaithfulArm::Pole(const CPoseMatcher& matcher) const
 {
     const size_t last = m_kPath.size() - 1;

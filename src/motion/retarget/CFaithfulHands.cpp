@@ -12,10 +12,10 @@ namespace gw {
 
 namespace {
 
-constexpr float kHeadMiddle = 100.0f; // millimetres from the head's joint, as the neck points
-constexpr double kLeastWay = 0.05;    // a hand that is moved by less is where it should be
+constexpr float kHeadMiddle = 100.0f; // millimeters from the head's joint, in the neck's direction
+constexpr double kLeastWay = 0.05;    // in millimeters; smaller corrections are skipped
 
-// What eight places of a body are to its hands.
+// Sorts the eight positions of a body by what they mean to its hands.
 TouchPoints PointsOf(const Vec3* places)
 {
     const Vec3& neck = places[6];
@@ -98,7 +98,8 @@ TouchPoints CFaithfulHands::SourceAt(size_t frame, const std::function<Vec3(cons
     return PointsOf(places);
 }
 
-// Over the floor at the root's height, but not far from the origin, where places have no room for a gap.
+// Poses the target with the root at its real height but at x = z = 0. Far from the origin, a float position
+// is too coarse for a small gap.
 void CFaithfulHands::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
     for (const size_t index : m_kBones)

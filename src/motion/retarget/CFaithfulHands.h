@@ -10,25 +10,26 @@
 
 namespace gw {
 
-/// Lets the target's hands touch what the source's touch, after its trunk and legs are posed. Two rounds over
-/// the frames: Append while the source goes by; then Plan and WriteFrame.
+/// Makes the target's hands touch what the source's hands touch, once its trunk and legs are posed. This
+/// takes two passes over the frames: call Append for each frame of the source, then Plan, then WriteFrame for
+/// each frame.
 class CFaithfulHands
 {
 public:
-    /// Plans both arms, or none: without a root, or where an arm, a leg, neck or head is not mapped. Both
-    /// trees stand in rest pose.
+    /// Plans both arms, or neither if there is no root or if an arm, a leg, the neck or the head is not
+    /// mapped. Both trees must be in rest pose.
     CFaithfulHands(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot,
                    const std::vector<CFaithfulLeg>& legs);
 
-    /// The source's joints that are looked at.
+    /// Returns the source's joints that are read.
     std::vector<CNode*> Joints() const;
-    /// Takes the source's present pose as the next frame.
+    /// Adds the source's current pose as the next frame.
     void Append();
-    /// Finds what hands touch and where they are to be. `onTarget` takes a place of the source to the
-    /// target's lengths and floor. The tracks hold the whole motion but for hands.
+    /// Finds what the hands touch and where they must go. `onTarget` converts a position of the source to the
+    /// target's scale and floor. `tracks` contain the finished motion except for the hands.
     void Plan(const std::vector<CKeyframeControl*>& tracks, const std::function<Vec3(const Vec3&)>& onTarget,
               double secondsPerFrame, bool hasFloor);
-    /// Replaces the keys of the arms in a frame in which a hand is to be elsewhere.
+    /// Replaces the arms' rotation keys in a frame if a hand has to move.
     void WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
 
 private:
@@ -42,9 +43,9 @@ private:
     CPoseMatcher& matcher_;
     std::vector<CFaithfulArm> m_kArms;
     std::vector<CNode*> m_kSource; // hands, hips, knees, neck, head
-    std::vector<size_t> m_kJoints; // the target's bones at the same places
-    std::vector<size_t> m_kBones;  // these and those above them; parents first
-    std::vector<Vec3> m_kPlaces;   // of the source, kJoints a frame
+    std::vector<size_t> m_kJoints; // the target's bones, in the same order
+    std::vector<size_t> m_kBones;  // m_kJoints and all bones above them; parents first
+    std::vector<Vec3> m_kPlaces;   // positions of m_kSource, kJoints per frame
     std::optional<CHandPlan> plan_;
 };
 

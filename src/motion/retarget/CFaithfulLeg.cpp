@@ -20,7 +20,7 @@ double SegmentLength(const CNode& joint)
     return Vec3Length(joint.m_kMatrix.Translation());
 }
 
-// The direction from one joint to the next; the one before where they stand at one place.
+// Returns the direction from one joint to the next, or `before` if both are at the same position.
 Vec3 DirectionOr(const Vec3& before, const CNode& from, const CNode& to)
 {
     const Vec3 direction =
@@ -28,7 +28,7 @@ Vec3 DirectionOr(const Vec3& before, const CNode& from, const CNode& to)
     return direction == kVec3Zero ? before : direction;
 }
 
-// The rules take a leg's bones for joints one below the other.
+// Returns whether the leg has all joints that are needed: thigh, knee and ankle.
 bool IsWhole(const LegJoints& leg)
 {
     return leg.thigh && leg.knee && leg.ankle;

@@ -9,46 +9,50 @@
 
 namespace gw {
 
-/// One leg of the target that keeps to its source's: which bones make it, how long they are, and what source
-/// and target do frame by frame.
+/// One leg of the target that follows a leg of the source: its bones, their lengths, and the motion of source
+/// and target, frame by frame.
 class CFaithfulLeg
 {
 public:
-    /// World directions; lengths of the target.
+    /// One frame of the leg. Directions are in world space, lengths in the target's units.
     struct Frame
     {
         Vec3 thigh;           ///< unit direction of the source from hip to knee
         Vec3 shin;            ///< unit direction of the source from knee to ankle
-        Vec3 hip = kVec3Zero; ///< the target's hip joint, from its root
-        Vec3 toe = kVec3Zero; ///< the target's toe joint, from its ankle; zero without one
-        float sole = 0.0f;    ///< how far the sole's lower end lies below the target's ankle
+        Vec3 hip = kVec3Zero; ///< the target's hip joint, relative to its root
+        Vec3 toe = kVec3Zero; ///< the target's toe joint, relative to its ankle; zero without one
+        float sole = 0.0f;    ///< how far the sole's lower end is below the target's ankle
     };
 
-    /// Plans a leg by the joints of the target, which stands in rest pose with its soles on `restFloor`.
-    /// Nothing where a joint but the toe is missing or without a source of its own.
+    /// Plans a leg from the joints of the target, which must be in rest pose with its soles at the height
+    /// `restFloor`. Returns nothing if a joint other than the toe is missing, has no source, or shares its
+    /// source with another joint of the leg.
     static std::optional<CFaithfulLeg> Plan(const CRetargeter& retargeter, const CPoseMatcher& matcher,
                                             const LegJoints& target, double restFloor);
 
-    /// The joints of the source. The toe is null where its foot has no joint below.
+    /// Returns the joints of the source. The toe is null if the foot has no joint below it.
     const LegJoints& Source() const { return m_kSource; }
-    /// Takes the source's present pose as the next frame.
+    /// Adds the source's current pose as the next frame.
     void AppendSource();
-    /// Takes the target's pose in a frame from the matcher's world matrices.
+    /// Reads the target's pose of a frame from the matcher's world matrices. The frame must have been
+    /// appended.
     void ReadTarget(const CPoseMatcher& matcher, size_t frame);
 
     const Frame& At(size_t frame) const { return m_kFrames[frame]; }
     const LegLengths& Lengths() const { return m_kLengths; }
-    /// From hip to ankle where thigh and calf point as the source's.
+    /// Returns the vector from hip to ankle if thigh and calf point in the source's directions.
     Vec3 Stretch(size_t frame) const;
-    /// The bend of the source's knee; see YieldKnee.h.
+    /// Returns the bend of the source's knee, 0 to 1; see YieldKnee.h.
     double KneeBend(size_t frame) const;
-    /// Where the knee stands off the line from hip to ankle, mostly: a direction in the world, not unit.
+    /// Returns the usual direction from the line between hip and ankle to the knee, for the matcher's current
+    /// pose: in world space, not normalized.
     Vec3 Forward(const CPoseMatcher& matcher) const;
 
     size_t Thigh() const { return m_uiThigh; } ///< index of the target's bone
     size_t Calf() const { return m_uiCalf; }   ///< index of the target's bone
     size_t Foot() const { return m_uiFoot; }   ///< index of the target's bone
-    /// The target's bones from the root down to the foot, and the toe behind it if there is one.
+    /// Returns the indices of the target's bones from the root down to the foot, and to the toe if there is
+    /// one.
     const std::vector<size_t>& Path() const { return m_kPath; }
 
 private:
@@ -61,9 +65,9 @@ private:
     size_t m_uiFoot;
     int m_iToe; // -1 for a foot without one
     LegLengths m_kLengths;
-    Vec3 m_kHeelSole;            // in the foot's space
-    float m_fToeSole = 0.0f;     // below the toe joint however it is bent: some sources bend it in one frame
-    Vec3 m_kForward = kVec3Zero; // sum over the frames, in the thigh's space
+    Vec3 m_kHeelSole;        // in the foot's space
+    float m_fToeSole = 0.0f; // below the toe joint, however it is bent: some sources bend it within one frame
+    Vec3 m_kForward = kVec3Zero; // summed over the frames, in the thigh's space
     std::vector<size_t> m_kPath;
     std::vector<Frame> m_kFrames;
 };

@@ -13,8 +13,8 @@ namespace gw {
 
 namespace {
 
-// A straight leg's knee is kept this far on its own side, in millimetres; a bent one's stands ten times
-// farther off the line from hip to ankle.
+// How much the knee's usual side counts, in millimeters. It decides for a straight leg; the knee of a bent
+// one is ten times farther from the line between hip and ankle.
 constexpr float kForwardHint = 10.0f;
 
 std::vector<LegJoints> TargetLegs(CNode* root)
@@ -84,8 +84,8 @@ void CFaithfulPose::Append()
         leg.AppendSource();
 }
 
-// Brings the bones of the legs to the matched pose of a frame, with the root at the origin: far from it a
-// world position has no room for a sole.
+// Poses the bones of the legs as matched in a frame, with the root at the origin. Far from the origin, a
+// float position is too coarse for the height of a sole.
 void CFaithfulPose::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
     for (const CFaithfulLeg& leg : m_kLegs)
@@ -133,7 +133,7 @@ void CFaithfulPose::WriteHands(size_t frame, const std::vector<CKeyframeControl*
     m_kHands.WriteFrame(frame, tracks);
 }
 
-// The knee's place from the hip, in the plane of the source's.
+// Returns the position of the knee relative to the hip, in the plane of the source's leg.
 Vec3 CFaithfulPose::KneePlace(size_t k, size_t frame, const Vec3& ankle) const
 {
     const CFaithfulLeg& leg = m_kLegs[k];

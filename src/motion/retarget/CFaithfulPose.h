@@ -14,37 +14,38 @@ namespace gw {
 
 class CKeyframeControl;
 
-/// Lets a matched motion keep to the source where the plain rules do not: the trunk leans as the source's;
-/// the middle of the hip joints goes the source's way, in leg lengths; thighs and calves point as the
-/// source's; feet keep their turn, and stand still on y = 0 where the source's stand; hands touch what the
-/// source's touch.
+/// Keeps a matched motion closer to the source than matching bone by bone does. The trunk leans like the
+/// source's. The midpoint of the hip joints follows the source's path, scaled by leg length. Thighs and
+/// calves point in the source's directions. Feet keep their rotation, and stand still on y = 0 while the
+/// source's feet stand. Hands touch what the source's hands touch.
 ///
-/// It takes three rounds over the frames: Append while the source goes by and is matched; then Plan, which
-/// needs all of it, and WriteFrame; then, for hands, PlanHands and WriteHands.
+/// This takes three passes over the frames. First, call Append after each frame of the source is matched.
+/// Then call Plan, which needs all frames, and WriteFrame for each frame. Finally, for the hands, call
+/// PlanHands, and WriteHands for each frame.
 class CFaithfulPose
 {
 public:
-    /// Plans the legs, or none without a root, and the arms where hands are to be held. Both trees stand in
+    /// Plans the legs, and the arms if `holdHands` is set; without a root, nothing. Both trees must be in
     /// rest pose.
     CFaithfulPose(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot, bool holdHands);
 
-    /// The legs that keep to their source. Without one there is nothing to do.
+    /// Returns the legs that follow the source. If there are none, there is nothing to do.
     const std::vector<CFaithfulLeg>& Legs() const { return m_kLegs; }
-    /// The source's joints that are looked at.
+    /// Returns the source's joints that are read.
     std::vector<CNode*> SourceJoints() const;
-    /// Takes the source's present pose as the next frame, and lets the trunk of the matched pose lean as it
-    /// does.
+    /// Adds the source's current pose as the next frame, and makes the trunk of the matched pose lean like
+    /// it.
     void Append();
-    /// Finds the root's way and where feet stand; see CStandPlan. The tracks hold the matched motion, as many
-    /// frames as were appended.
+    /// Plans the path of the root and where the feet stand; see CStandPlan. `tracks` contain the matched
+    /// motion, with one key per appended frame.
     void Plan(const std::vector<CKeyframeControl*>& tracks, const Vec3& origin, double secondsPerFrame,
               bool holdFeet);
-    /// Replaces the keys of root and legs in a frame. A key for which there is no finite value stays.
+    /// Replaces the keys of root and legs in a frame. A key keeps its value if the new one is not finite.
     void WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
 
-    /// Finds where hands are to be, once all frames are written; does nothing where they are not held.
+    /// Plans where the hands go. Call it after WriteFrame for all frames. Does nothing if hands are not held.
     void PlanHands(const std::vector<CKeyframeControl*>& tracks, double secondsPerFrame);
-    /// Replaces the keys of the arms in a frame.
+    /// Replaces the arms' rotation keys in a frame.
     void WriteHands(size_t frame, const std::vector<CKeyframeControl*>& tracks);
 
 private:

@@ -1,12 +1,14 @@
-// A hand that rests on a thigh, claps or props itself on the floor is seen to do so by the gap between the
-// two. On a target with longer arms the same directions lead past it or into it. So the gap is kept, and
-// nothing else: the hand may lie farther up or down the thigh.
+// When a hand rests on a thigh, claps, or leans on the floor, what a viewer sees is the gap between the two.
+// On a target with longer arms, the same bone directions put the hand past the thigh or inside it. So the gap
+// is kept, and nothing else: the hand may end up farther up or down the thigh.
 //
-// Thighs and trunk are segments. In the source, n is the way from the nearest point of the segment to the
-// hand. In the target, the hand is wanted at the point of its segment that is nearest to the free hand, plus
-// n, made perpendicular to the segment at its length. Head and other hand are points, and the floor is a
-// height. Near things count more than far ones, and things out of touch not at all. Between touches least
-// squares over all frames lead the hand back onto its free path, as they do with feet (CBandFit).
+// Thighs and trunk are segments. In the source, n is the vector from the nearest point of the segment to the
+// hand. In the target, the goal starts at the point of its segment that is nearest to the free hand. From
+// there it is as far away as n is long, in a direction between the free hand's and n, made perpendicular to
+// the segment unless the nearest point is one of its ends. The head and the other hand are points, and the
+// floor is a height. Near things count more than far ones, and things out of reach do not count at all.
+// Between touches, least squares over all frames bring the hand back to its free path, as for feet
+// (CBandFit).
 
 #include "CHandPlan.h"
 
@@ -20,20 +22,20 @@ namespace gw {
 
 namespace {
 
-// Millimetres of the target.
-constexpr double kTouch = 30.0; // a gap that is kept in full
-constexpr double kNear = 50.0;  // a gap that counts half as much as none
-constexpr double kFade = 30.0;  // beyond that, until it is not kept at all
-constexpr double kThigh = 50.0; // from the middle of things to where a wrist lies on them
+// In millimeters of the target. A gap is the distance minus the thickness of the thing.
+constexpr double kTouch = 30.0; // up to this gap, a touch counts in full, apart from kNear
+constexpr double kNear = 50.0;  // the factor for near gaps is 1/2 at this gap, before it is squared
+constexpr double kFade = 30.0;  // over this distance beyond kTouch, a touch fades out
+constexpr double kThigh = 50.0; // thickness: from the middle of a thing to a wrist that lies on it
 constexpr double kTrunk = 60.0;
 constexpr double kHead = 80.0;
 constexpr double kHand = 50.0;
 constexpr double kFloor = 40.0;
-constexpr double kOnFloor = 20.0; // a wrist is never wanted lower
+constexpr double kOnFloor = 20.0; // the goal of a wrist is never lower
 
-constexpr double kTouchWeight = 60.0; // of a hand that touches, against 1 for its free path
+constexpr double kTouchWeight = 60.0; // weight of a hand that touches; its free path has weight 1
 
-// Of the source's side of a thing, against that on which the hand is anyhow.
+// Weight of the side of a thing on which the source's hand is, against 1 for the side of the free hand.
 constexpr float kSourceSide = 0.5f;
 
 struct Segment
@@ -56,7 +58,7 @@ Vec3 HipMiddle(const TouchPoints& body)
     return (body.hips[0] + body.hips[1]) * 0.5f;
 }
 
-// How much a gap is to be kept: near ones more than the many that are just in touch.
+// Returns the weight of a gap. Close ones count more than the many that are just close enough to count.
 double WeightOf(double distance, double thickness)
 {
     const double gap = distance - thickness;
@@ -64,8 +66,8 @@ double WeightOf(double distance, double thickness)
     return (1.0 - Smoothstep((gap - kTouch) / kFade)) * near * near;
 }
 
-// Where a hand is wanted by a segment: as far from it as the source's, on the side that lies between its own
-// and the source's.
+// Returns a hand's goal for one segment: at the source's distance, on a side between the hand's own and the
+// source's.
 Vec3 WantedAt(const Segment& source, const Segment& target, const Vec3& sourceHand, const Vec3& hand)
 {
     const Vec3 way = sourceHand - source.Nearest(sourceHand);

@@ -9,31 +9,33 @@
 
 namespace gw {
 
-/// What of a body hands touch, and the hands: places by side. In millimetres of the target over its floor,
-/// also those of the source.
+/// The hands of a body and the points that hands touch; pairs are indexed by side. Positions are in
+/// millimeters of the target, above its floor, for the source as well.
 struct TouchPoints
 {
     std::array<Vec3, 2> hands{};
     std::array<Vec3, 2> hips{};
     std::array<Vec3, 2> knees{};
     Vec3 neck = kVec3Zero;
-    Vec3 head = kVec3Zero; ///< its middle
+    Vec3 head = kVec3Zero; ///< middle of the head
 };
 
-/// How far a hand is to be moved so that it is as far from thighs, trunk, head, the other hand and the floor
-/// as the source's is, where that touches them or nearly does.
+/// Plans how far to move each hand so that it keeps the source's distance to thighs, trunk, head, the other
+/// hand and the floor, whenever the source's hand touches or nearly touches one of them.
 class CHandPlan
 {
 public:
-    /// Without a floor hands may go anywhere below the body.
+    /// Without a floor, the height of the hands is not limited.
     CHandPlan(size_t frameCount, double secondsPerFrame, bool hasFloor);
 
-    /// Whether hands come near to something in a pose of the source.
+    /// Returns whether a hand touches or nearly touches something in a pose of the source.
     bool Touches(const TouchPoints& source) const;
-    /// Takes the poses of a frame; the target's as it is so far. Frames may be left out.
+    /// Adds the poses of a frame: the source's, and the target's before its hands are moved. Frames may be
+    /// skipped.
     void Add(size_t frame, const TouchPoints& source, const TouchPoints& target);
-    /// Finds the ways of both hands for all frames; to be called once.
+    /// Computes the corrections of both hands for all frames. Call it only once, after the last Add.
     void Solve();
+    /// Returns how far to move a hand in a frame, in millimeters. Call it only after Solve.
     Vec3 Way(size_t side, size_t frame) const { return m_kWays[side][frame]; }
 
 private:

@@ -1,7 +1,7 @@
 // Plants feet by inverse kinematics. For each leg, the source's ankle relative to its pelvis, scaled to the
-// target, becomes the goal of a closed-form solver (CLimbChain), and the source's knee the hint for its bend.
-// The solver works in its own frame, in which the hinge axis is Y, so goals and results pass through
-// AxisSwapForward and back.
+// target, becomes the goal of a closed-form solver (CLimbChain), and the source's knee is the hint for its
+// bend. The solver works in its own frame, in which the hinge axis is Y, so goals are converted with
+// AxisSwapForward and results are converted back.
 
 #include "CLegPlanter.h"
 

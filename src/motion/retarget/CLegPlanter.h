@@ -11,8 +11,8 @@ class CFaithfulLeg;
 class CKeyframeControl;
 struct HostSide;
 
-/// Plants the feet: rotates thigh and calf of each leg so that the ankle's position relative to the pelvis is
-/// the source's, scaled. Feet keep their rotation.
+/// Plants the feet: rotates thigh and calf of each leg so that the ankle's position relative to the pelvis
+/// matches the source's, scaled. Feet keep their rotation.
 class CLegPlanter
 {
 public:

@@ -8,29 +8,30 @@ namespace gw {
 
 class CNode;
 
-/// What root, hips and feet of a source do, frame by frame.
+/// The motion of a source's root, hips and feet, frame by frame.
 class CSourceBody
 {
 public:
-    /// `root` is the joint that drives the target's root; null for one that does not move. The tree stands in
-    /// rest pose.
+    /// `root` is the joint that drives the target's root, or null if nothing does. The tree must be in rest
+    /// pose.
     CSourceBody(const CNode* root, const std::vector<LegJoints>& legs);
 
-    /// The joints that are looked at.
+    /// Returns the joints of the legs.
     std::vector<CNode*> Joints() const;
-    /// Takes the present pose as the next frame; the first one tells how long the legs are.
+    /// Adds the current pose as the next frame. The first frame also sets the length of the legs.
     void Append();
 
     size_t FrameCount() const { return m_kRoots.size(); }
-    /// The legs' mean length.
+    /// Returns the mean length of the legs, in the source's units.
     double LegLength() const { return m_kFeet.LegLength(); }
+    /// Returns the world position of the root; zero if there is none.
     const Vec3& Root(size_t frame) const { return m_kRoots[frame]; }
-    /// The middle of the hip joints.
+    /// Returns the world position of the midpoint of the hip joints.
     const Vec3& Hips(size_t frame) const { return m_kHips[frame]; }
     const CLegTrack& Leg(size_t leg) const { return m_kFeet.Legs()[leg]; }
-    /// The contacts of each leg; none where legs have no length.
+    /// Returns the contacts of each leg. The lists are empty if the legs have no length.
     std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
-    /// What each leg touches the floor with; nothing where legs have no length.
+    /// Returns the touches of each leg. They are empty, and nothing has landed, if the legs have no length.
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:

@@ -1,13 +1,15 @@
-// Feet that stand, hips that go as the source's and legs that point as the source's cannot all be had on a
-// body of other proportions. What gives way is chosen by what an eye forgives: nobody sees that the hips go a
-// centimetre higher, everybody that a knee jerks, a foot slides or the hips swing.
+// On a body with other proportions, three things cannot all hold: feet that stay planted, hips that move like
+// the source's, and legs that point in the source's directions. What gives way is decided by what a viewer
+// notices. Nobody sees that the hips are a centimeter higher; everybody sees a knee jerk, a foot slide or the
+// hips sway.
 //
-// So the middle of the hip joints goes the source's way over the ground, and the root is wherever its hips
-// then have it. The source's directions give the free path of each ankle. Contacts hold the foot near to it
-// (HoldFoot) and put its sole on the floor (LandFoot). What the legs then lack or have too much, the hips'
-// height gives them: a smooth curve by least squares over all frames. Where the ankles go hangs on that
-// height, so this is done in rounds; three are enough, since each leaves a small part of what it found. What
-// is left over is the knee's, as far as it is bent and can take that without a jerk (YieldKnee).
+// So the midpoint of the hip joints follows the source's path over the ground, and the root is placed to
+// match. The source's leg directions then give the free path of each ankle. Contacts hold the foot close to
+// that path (HoldFoot) and put its sole on the floor (LandFoot). If the legs are now too short or too long,
+// the height of the hips makes up the difference: a smooth curve, fitted by least squares over all frames.
+// The ankles depend on that height, so the fit is iterated. Three rounds are enough, because each leaves only
+// a small part of the error it started with. The knee absorbs the rest, as far as it is bent and can do so
+// without a jerk (YieldKnee).
 
 #include "CStandPlan.h"
 
@@ -23,13 +25,13 @@ namespace gw {
 
 namespace {
 
-// Lengths are millimetres of the target.
+// Lengths are in millimeters of the target.
 constexpr int kRounds = 3;
-constexpr double kLiftHertz = 5.0;      // the height of the hips follows a run's steps, not a foot that rocks
-constexpr double kRestWeight = 1e-4;    // of no lift at all, against 1 for a leg that stands
-constexpr double kLiftLimit = 150.0;    // a source that asks for more does not stand on one floor
-constexpr double kMissed = 8.0;         // of a foot that stands: a sole so far off counts twice
-constexpr double kLeastFirmness = 0.02; // of a leg whose knee is bent, however far
+constexpr double kLiftHertz = 5.0;      // fast enough for the steps of a run, too slow for a rocking foot
+constexpr double kRestWeight = 1e-4;    // weight of no lift at all; a standing leg has weight 1
+constexpr double kLiftLimit = 150.0;    // a source that needs more does not stand on a single floor
+constexpr double kMissed = 8.0;         // a standing foot whose sole is off by this much counts twice
+constexpr double kLeastFirmness = 0.02; // minimum for any leg, however far its knee is bent
 
 double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 {
@@ -63,7 +65,7 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
         LiftRoot(secondsPerFrame);
 }
 
-// The middle of the target's hip joints from its root.
+// Returns the midpoint of the target's hip joints, relative to its root.
 Vec3 CStandPlan::Hips(size_t frame) const
 {
     Vec3 hips = kVec3Zero;
@@ -82,20 +84,20 @@ void CStandPlan::PlaceRoot(const Vec3& origin)
         root = root + shift;
 }
 
-// The place of an ankle whose leg points as the source's.
+// Returns the position of the ankle if the leg points in the source's directions.
 Vec3 CStandPlan::FreeAnkle(size_t leg, size_t frame) const
 {
     return m_kRoots[frame] + legs_[leg].At(frame).hip + legs_[leg].Stretch(frame);
 }
 
-// The height of the lower end of its sole.
+// Returns the height of the lower end of that foot's sole.
 float CStandPlan::FreeSole(size_t leg, size_t frame) const
 {
     return FreeAnkle(leg, frame).y - legs_[leg].At(frame).sole;
 }
 
-// Raises the whole motion so that it stands on the floor: by the median of the contacts, and where there are
-// none by its lowest frames.
+// Raises or lowers the whole motion onto the floor, using the median of the contacts or, without contacts,
+// the lowest frames.
 void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts)
 {
     std::vector<float> standing;
@@ -161,9 +163,9 @@ void CStandPlan::LandLeg(size_t leg, const std::vector<float>& landed, double se
         m_kAnkles[leg][frame].y = static_cast<float>(soles[frame]) + legs_[leg].At(frame).sole;
 }
 
-// A leg that is longer than the way to its ankle by some length wants its hip higher by as much, or by more
-// where it slants, and less firmly. A bent knee takes most of it in its stride; a sole that would hang over
-// the floor or lie below it does not.
+// If a leg is too long for the distance to its ankle, its hip should rise by the difference. A slanted leg
+// needs more lift, with less weight. A bent knee absorbs most of the difference, so it gets little weight; a
+// sole that would end up above or below the floor gets more.
 void CStandPlan::AddWish(size_t leg, size_t frame, CBandFit& lifts) const
 {
     const LegLengths& lengths = legs_[leg].Lengths();

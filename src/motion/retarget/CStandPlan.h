@@ -10,22 +10,24 @@ namespace gw {
 
 class CBandFit;
 
-/// Where the target's root and its ankles are to be in every frame, found from all frames at once.
+/// Plans where the target's root and ankles go in every frame, computed from all frames together.
 class CStandPlan
 {
 public:
-    /// The legs have read all frames of source and target; they and the source must outlive the plan. The
-    /// root begins over the x and z of `origin`. Without `holdFeet` legs point as the source's, wherever the
-    /// feet come to.
+    /// Makes the plan. `legs` must already have read all frames of source and target; `legs` and `source`
+    /// must outlive the plan. The root starts above the x and z of `origin`. Without `holdFeet`, the legs
+    /// point in the source's directions, wherever that puts the feet.
     CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, const Vec3& origin,
                double secondsPerFrame, bool holdFeet);
 
+    /// Returns the position of the root, in millimeters of the target.
     const Vec3& Root(size_t frame) const { return m_kRoots[frame]; }
-    /// The ankle of a leg from its hip, within the leg's reach.
+    /// Returns the ankle relative to the hip of the same leg; it is always within the leg's reach.
     Vec3 Ankle(size_t leg, size_t frame) const;
-    /// A place of the source in the target's lengths and over its floor, but not over the same point of it.
+    /// Converts a position of the source to the target's scale and floor height. The horizontal position is
+    /// only scaled, not moved to where the target is.
     Vec3 OnTarget(const Vec3& place) const;
-    /// Whether the source stands in any frame: a diver has no floor.
+    /// Returns whether the source stands in any frame. A diver, for example, has no floor.
     bool HasFloor() const { return m_bHasFloor; }
 
 private:
@@ -44,13 +46,13 @@ private:
 
     const std::vector<CFaithfulLeg>& legs_;
     const CSourceBody& source_;
-    double m_fScale; // of the source's lengths
+    double m_fScale; // target lengths / source lengths
     bool m_bHasFloor = false;
-    float m_fRaised = 0.0f; // how much higher the source stands on the target's scale
+    float m_fRaised = 0.0f; // what to add to the scaled source's heights to put it on the target's floor
     std::vector<Vec3> m_kRoots;
-    std::vector<float> m_kLifts;               // what of the roots' heights has been added for the legs
-    std::vector<std::vector<Vec3>> m_kAnkles;  // by leg and frame; empty where feet are not held
-    std::vector<std::vector<float>> m_kLanded; // how surely a sole is on the floor, by leg and frame
+    std::vector<float> m_kLifts;               // the part of the roots' heights that was added for the legs
+    std::vector<std::vector<Vec3>> m_kAnkles;  // by leg and frame; empty if feet are not held
+    std::vector<std::vector<float>> m_kLanded; // confidence that a sole is on the floor
 };
 
 } // namespace gw

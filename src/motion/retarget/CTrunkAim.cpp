@@ -30,8 +30,8 @@ namespace gw {
 
 namespace {
 
-// A larger difference between the lines at rest comes from a pose in which nobody stands, not from
-// proportions.
+// A larger difference between the lines at rest does not come from proportions: one of the rest poses is not
+// a standing pose.
 constexpr double kMostRestDegrees = 30.0;
 
 constexpr const char* kTrunkJoints[] = {kRootBone, kWaistBone, kTorsoBone, kNeckBone};
@@ -59,7 +59,8 @@ CTrunkAim::CTrunkAim(const CRetargeter& retargeter, const CPoseMatcher& matcher,
     m_bIsPlanned = true;
 }
 
-// False where the target is built otherwise: each joint of the trunk is the parent of the next.
+// Finds the target's trunk and thighs. Returns false if a bone is missing or if a joint of the trunk is not
+// the parent of the next.
 bool CTrunkAim::FindBones(const CPoseMatcher& matcher, CNode* targetRoot)
 {
     for (size_t i = 0; i <= kBones; ++i)
@@ -90,14 +91,14 @@ void CTrunkAim::PlanShares(const CNode& neck, const CNode& top)
         share /= whole;
 }
 
-// The source's direction from its hips to where the target's neck is on the line.
+// Returns the source's direction from its hips to the point of the line that matches the target's neck.
 Vec3 CTrunkAim::Chord() const
 {
     return Vec3Normalized(m_kLine.At(m_afShares[kBones]) - m_kLine.At(0.0));
 }
 
-// Skeletons whose lines differ at rest, because one has its neck farther back, keep that difference: a target
-// that stands upright when its source does.
+// If the lines differ at rest, for example because one neck is farther back, the target keeps that
+// difference. So it stands upright when its source does.
 void CTrunkAim::PlanRest()
 {
     if (!m_kLine.Read())
@@ -109,7 +110,7 @@ void CTrunkAim::PlanRest()
         m_kRestSwing = LeastSwing(kVec3UnitY, chord);
 }
 
-// The same difference in the present pose: it goes along with the source's trunk.
+// Returns the same difference for the current pose: it rotates with the source's trunk.
 Mat3 CTrunkAim::RestTurn() const
 {
     const Mat3 upright = TurnUpright(Chord(), Vec3Normalized(m_kLine.Across()));
@@ -132,8 +133,8 @@ void CTrunkAim::PlanHanging(const CPoseMatcher& matcher)
     m_kWorlds.resize(bones.size());
 }
 
-// From the middle of the target's hip joints to its root, where these are posed for themselves; zero where
-// they turn with the root.
+// Returns the vector from the midpoint of the target's hip joints to its root. Zero if the hip joints rotate
+// with the root instead of with posed bones of their own.
 Vec3 CTrunkAim::Pelvis(const CPoseMatcher& matcher) const
 {
     Vec3 hips = kVec3Zero;
@@ -152,7 +153,7 @@ Vec3 CTrunkAim::Pelvis(const CPoseMatcher& matcher) const
     return -hips;
 }
 
-// Where the bones are to point.
+// Returns the unit directions in which the bones must point.
 std::array<Vec3, CTrunkAim::kBones> CTrunkAim::Directions(const Vec3& pelvis) const
 {
     const bool rides = pelvis == kVec3Zero;

@@ -8,19 +8,19 @@
 
 namespace gw {
 
-/// Makes the target's trunk lean and bend like the source's line from the middle of its hip joints to its
-/// neck, regardless of proportions: the line from hips to neck points in the source's direction, apart from
-/// the difference that the two rest poses have. Bones attached to the trunk keep their world rotations.
+/// Makes the target's trunk lean and bend like the source's, regardless of proportions. The line from the
+/// midpoint of the hip joints to the neck points in the source's direction, except for the difference between
+/// the two rest poses. Bones attached to the trunk keep their world rotations.
 class CTrunkAim
 {
 public:
-    /// Does nothing without a root, where the target lacks a bone of the trunk, or the source a hip joint or
-    /// what drives neck and head. Both trees stand in rest pose.
+    /// Plans the trunk. Both trees must be in rest pose. The object does nothing without a root, if the
+    /// target has no complete trunk, or if the source has no hip joints or nothing that drives neck or head.
     CTrunkAim(const CRetargeter& retargeter, const CPoseMatcher& matcher, CNode* targetRoot);
 
-    /// The source's joints that are looked at.
+    /// Returns the source's joints that are read.
     std::vector<CNode*> Joints() const { return m_bIsPlanned ? m_kLine.Joints() : std::vector<CNode*>(); }
-    /// Turns the trunk's bones in the matcher's present pose, by that of the source.
+    /// Rotates the trunk's bones in the matcher's current pose to match the source's current pose.
     void Aim(CPoseMatcher& matcher);
 
 private:
@@ -39,15 +39,15 @@ private:
 
     bool m_bIsPlanned = false;
     CTrunkLine m_kLine;
-    std::array<CNode*, kBones + 1> m_apkJoints{}; // of the target, from LowerTorso up to the neck
+    std::array<CNode*, kBones + 1> m_apkJoints{}; // the target's, from LowerTorso up to the neck
     std::array<size_t, kBones> m_auiBones{};
-    std::array<double, kBones + 1> m_afShares{}; // of the joints on the line
-    std::array<CNode*, 2> m_apkThighs{};         // of the target
+    std::array<double, kBones + 1> m_afShares{}; // of the joints, as fractions of the line
+    std::array<CNode*, 2> m_apkThighs{};         // the target's
     Mat3 m_kRestSwing = kMat3Identity; // from the source's line at rest to the target's, in trunk axes
-    std::vector<size_t> m_kRiders;     // unposed bones that hang on the trunk; parents first
-    std::vector<size_t> m_kHanging;    // posed bones that hang on the trunk or on those
-    std::vector<Mat3> m_kKept;         // the world rotations of these, by m_kHanging
-    std::vector<Mat3> m_kWorlds;       // by bone; of trunk and riders, in the pose that is aimed
+    std::vector<size_t> m_kRiders;     // unposed bones attached to the trunk; parents first
+    std::vector<size_t> m_kHanging;    // posed bones attached to the trunk or to riders
+    std::vector<Mat3> m_kKept;         // world rotations of the bones in m_kHanging
+    std::vector<Mat3> m_kWorlds;       // world rotations of trunk and riders after aiming, by bone
 };
 
 } // namespace gw

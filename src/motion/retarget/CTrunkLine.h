@@ -9,31 +9,33 @@ namespace gw {
 
 class CNode;
 
-/// The line of a source's trunk: from the middle of its hip joints along its spine up to its neck.
+/// The line of a source's trunk, from the midpoint of its hip joints along the spine up to the neck.
 class CTrunkLine
 {
 public:
     CTrunkLine() = default;
-    /// `top` is the neck, or a joint above it; the spine is what lies between it and `hips`.
+    /// `top` is the neck or a joint above it. The spine consists of the joints between `hips` and `top`. The
+    /// line stays empty if a joint is null or if `top` is not below `hips` in the tree.
     CTrunkLine(const std::array<CNode*, 2>& thighs, CNode* hips, CNode* top);
 
-    /// Whether there is a line.
+    /// Returns whether there is a line.
     bool IsWhole() const { return m_kSpine.size() > 0; }
-    /// The joints that are looked at.
+    /// Returns the joints that are read.
     std::vector<CNode*> Joints() const;
-    /// Takes the joints' present places. False for a line without a length.
+    /// Reads the joints' current positions. Returns false if the line has no finite length above 0. Call it
+    /// only if IsWhole.
     bool Read();
-    /// The direction from the second hip joint to the first; not normalized.
+    /// Returns the vector from the second hip joint to the first; not normalized.
     Vec3 Across() const { return m_kAcross; }
-    /// The point at a share, 0 to 1, of the line's length from the hips up.
+    /// Returns the world position at a fraction, 0 to 1, of the line's length, counted from the hips.
     Vec3 At(double share) const;
 
 private:
     std::array<CNode*, 2> m_apkThighs{};
-    std::vector<CNode*> m_kSpine; // above the hips, the top included
+    std::vector<CNode*> m_kSpine; // above the hips, including the top
     Vec3 m_kAcross = kVec3Zero;
     std::vector<Vec3> m_kPoints;
-    std::vector<double> m_kArc; // how far along the line each point lies
+    std::vector<double> m_kArc; // distance of each point from the hips, along the line
 };
 
 } // namespace gw

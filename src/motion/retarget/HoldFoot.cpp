@@ -1,20 +1,22 @@
-// A foot that stands does so on its heel first, then flat, then on the ball while the heel comes up. On a
-// foot of another length ankle and toe cannot both do as the source's. With va and vt the speeds of the two
-// in the source, each asks for its own steps with the weight 1 / (v^2 + e^2), where e is a speed at which a
-// foot just stands. By least squares the point at the share
+// A foot stands on its heel first, then flat, then on its ball while the heel comes up. If the foot has a
+// different length, ankle and toe cannot both move like the source's. Let va and vt be their speeds in the
+// source. Each requests its own steps with the weight 1 / (v^2 + e^2), where e is a speed at which a foot
+// just stands. By least squares, the point at the fraction
 //
 //     u = (va^2 + e^2) / (va^2 + vt^2 + 2 e^2)
 //
-// of the way from ankle to toe goes as the source's does: it is at the one that stands, and between them
-// while both do. What the way from ankle to toe changes by then turns the foot about it.
+// of the line from ankle to toe moves like the source's. It is the joint that stands, or a point between the
+// two while both stand. As the vector from ankle to toe changes, the foot rotates about this point.
 //
-// The source's foot may drift while it stands: sensors do, and feet are dragged. That is told at the point
-// with a small e, which does not move where a foot rolls. Little of it is taken away, much is kept.
+// The source's foot may drift while it stands, because sensors drift and feet are dragged. The drift is
+// measured at the point for a small e, which does not move while a foot rolls. A short drift is mostly
+// removed, a long one mostly kept.
 //
-// So contacts tell the ankle's steps, not its places. The places follow by least squares over all frames:
-// contacts' steps, little way off the free path, no sudden change of that way. One solution gives each
-// contact its place and the swing between two contacts its blend. A source whose hips shake keeps that in its
-// feet: a foot held still below them would make the legs shake instead.
+// So contacts determine the steps of the ankle, not its positions. The positions follow by least squares over
+// all frames: match the steps of the contacts, stay close to the free path, and do not change the offset from
+// it suddenly. One solution gives each contact its position and blends the swing between two contacts. If the
+// source's hips shake, the feet keep that shaking: feet held still below shaking hips would make the legs
+// shake instead.
 
 #include "HoldFoot.h"
 
@@ -30,22 +32,22 @@ namespace gw {
 
 namespace {
 
-// Leg lengths a second.
+// In leg lengths per second.
 
-constexpr double kStillSpeed = 0.1; // of one that stands for sure
-constexpr double kDriftSpeed = 0.2; // of a foot that moves, and does not drift
+constexpr double kStillSpeed = 0.1; // of a foot that certainly stands
+constexpr double kDriftSpeed = 0.2; // of a foot that moves instead of drifting
 
-constexpr double kSpeedBlend = 0.05;  // seconds over which the pivot's share is smoothed
-constexpr double kDriftShare = 0.02;  // of a leg: half of a drift so long is kept
-constexpr double kHoldSeconds = 10.0; // a foot that is held off its free path creeps back in as long
-constexpr double kShakeHertz = 6.0; // what hips, legs and feet shake by faster, nobody takes out of the foot
+constexpr double kSpeedBlend = 0.05;  // seconds over which the speeds that set the pivot are smoothed
+constexpr double kDriftShare = 0.02;  // in leg lengths: half of a drift this long is kept
+constexpr double kHoldSeconds = 10.0; // how long a foot that is held off its free path takes to creep back
+constexpr double kShakeHertz = 6.0;   // faster shaking of hips, legs and feet is left in the foot
 
 Vec3 Between(const Vec3& a, const Vec3& b, double share)
 {
     return a + (b - a) * static_cast<float>(share);
 }
 
-// The speed of a joint in leg lengths a second, frame by frame.
+// Returns the smoothed speed of a joint in each frame, in leg lengths per second.
 std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secondsPerFrame)
 {
     std::vector<float> speeds;
@@ -61,7 +63,7 @@ std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secon
     return speeds;
 }
 
-// The pivots of one foot and what they do.
+// The point of the source's foot that stands in each frame, and how it moves.
 class CPivot
 {
 public:
@@ -70,20 +72,21 @@ public:
           m_kToe(SpeedsOf(foot.sourceToe, foot.leg, secondsPerFrame))
     {
     }
-    /// The share of the way from ankle to toe from a frame to the next one, for a speed e.
+    /// Returns where the pivot is between a frame and the next: 0 at the ankle, 1 at the toe. `still` is e.
     double Share(size_t frame, double still) const
     {
         return 0.5 * (ShareAt(frame, still) + ShareAt(frame + 1, still));
     }
-    /// The source's step from a frame to the next one, over the ground, at a share of the way to the toe.
+    /// Returns the horizontal step of the source's foot from a frame to the next, at a fraction of the line
+    /// from ankle to toe.
     Vec3 Step(size_t frame, double share) const
     {
         return OverGround(Between(foot_.sourceAnkle[frame + 1] - foot_.sourceAnkle[frame],
                                   foot_.sourceToe[frame + 1] - foot_.sourceToe[frame], share));
     }
-    /// How far the source's foot has drifted in each frame of a contact since the first.
+    /// Returns how far the source's foot has drifted since the start of a contact, one vector per frame.
     std::vector<Vec3> Drift(const Contact& contact) const;
-    /// Where it was in the frames in which it was slowest, on the whole.
+    /// Returns the mean drift of a contact, weighted toward the frames in which the foot is slowest.
     Vec3 Middle(const Contact& contact, const std::vector<Vec3>& drift) const;
 
 private:
@@ -123,14 +126,15 @@ Vec3 CPivot::Middle(const Contact& contact, const std::vector<Vec3>& drift) cons
     return sum * static_cast<float>(1.0 / total);
 }
 
-// What is kept of a drift: little of a short one and nearly all of a long one, without a corner between.
+// Returns the part of a drift that is kept: little of a short one, nearly all of a long one, with a smooth
+// transition.
 Vec3 KeptOf(const Vec3& drift, double play)
 {
     const double square = Vec3Dot(drift, drift);
     return drift * static_cast<float>(square / (square + play * play));
 }
 
-// What is taken away of a drift's step; nothing of a fast one.
+// Returns the part of a drift's step that is removed; almost nothing if the step is fast.
 Vec3 Lost(const Vec3& from, const Vec3& to, double leg, double secondsPerFrame)
 {
     const double play = kDriftShare * leg;

@@ -8,19 +8,19 @@
 
 namespace gw {
 
-/// The ways of a foot, place by place of every frame, all in the target's lengths.
+/// The paths of a foot: one position per frame, all in the target's scale.
 struct FootPaths
 {
-    std::span<const Vec3> free;        ///< the target's ankle, as it would go if nothing held it
-    std::span<const Vec3> toe;         ///< from the target's ankle to its toe
-    std::span<const Vec3> sourceAnkle; ///< of the source
-    std::span<const Vec3> sourceToe;   ///< of the source
-    double leg;                        ///< length
+    std::span<const Vec3> free;        ///< the target's ankle if nothing holds it
+    std::span<const Vec3> toe;         ///< vector from the target's ankle to its toe
+    std::span<const Vec3> sourceAnkle; ///< the source's ankle
+    std::span<const Vec3> sourceToe;   ///< the source's toe
+    double leg;                        ///< length of the target's leg
 };
 
-/// Where the ankle goes over the ground so that the foot stands still in the frames of the contacts, and
-/// rolls over its toe where the source's does: x and z of every frame. y is that of the free path. Outside of
-/// contacts the ankle goes back to its free path.
+/// Returns the ankle's path, one position per frame. In the frames of the contacts, x and z are such that the
+/// foot stands still, and rolls over its toe when the source's foot does. Outside of contacts, the ankle
+/// returns to its free path. y is always that of the free path.
 std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame);
 
 } // namespace gw

@@ -7,9 +7,9 @@ namespace gw {
 
 namespace {
 
-constexpr double kFullDip = 20.0;      // millimetres below the floor at which a sole that swings is led back
-constexpr double kLandedWeight = 20.0; // of a sole that stands, against 1 for the free path
-constexpr double kDipWeight = 10.0;    // of a sole that swings and dips: a tenth of the dip stays
+constexpr double kFullDip = 20.0;      // millimeters below the floor at which kDipWeight applies in full
+constexpr double kLandedWeight = 20.0; // weight of a sole that stands; the free path has weight 1
+constexpr double kDipWeight = 10.0;    // weight of a sole below the floor: about a tenth of the dip stays
 
 } // namespace
 

@@ -5,9 +5,10 @@
 
 namespace gw {
 
-/// Heights of the lower end of a foot's sole over the floor, frame by frame, in millimetres: on the floor
-/// where it has landed, hardly below it anywhere, and else on its free path. `free` is that path, if nothing
-/// held the foot; `landed` tells 0 to 1 how surely the sole is on the floor.
+/// Returns the height of the lower end of a foot's sole above the floor, in millimeters, one value per frame.
+/// The sole is on the floor once it has landed, never far below it, and otherwise on its free path. `free`
+/// contains the heights if nothing holds the foot; `landed` is the confidence, 0 to 1, that the sole is on
+/// the floor. Both have one value per frame.
 std::vector<double> LandFoot(std::span<const float> free, std::span<const float> landed,
                              double secondsPerFrame);
 

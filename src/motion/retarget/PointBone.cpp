@@ -9,11 +9,12 @@ namespace gw {
 
 namespace {
 
-// Below this cosine of the angle the sum of two directions is too short to tell the plane of the swing.
+// If the cosine of the angle between two directions is below this, their sum is too short to determine the
+// plane of the rotation.
 constexpr double kOpposite = -0.99;
 
-// LeastSwing of unit directions a and b without an angle: with v = a x b and c = a . b it is
-// c I + [v] + transpose(v) v / (1 + c), by Rodrigues' formula.
+// Does the same as LeastSwing for unit vectors a and b, without computing the angle. With v = a x b and
+// c = a . b, the rotation is c I + [v] + transpose(v) v / (1 + c), by Rodrigues' formula.
 Mat3 SwingBetween(const Vec3& a, const Vec3& b)
 {
     const double c = Vec3Dot(a, b);
@@ -40,7 +41,7 @@ Mat3 PointedTo(const Vec3& direction, const Mat3& bone, const Vec3& jointBelow)
     return bone * SwingBetween(Vec3Normalized(Turned(jointBelow, bone)), Vec3Normalized(direction));
 }
 
-// By the law of cosines.
+// Uses the law of cosines.
 Vec3 MiddleJoint(const LegLengths& limb, const Vec3& end, const Vec3& side)
 {
     const double distance = Vec3Length(end);

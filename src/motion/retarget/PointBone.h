@@ -5,13 +5,13 @@
 
 namespace gw {
 
-/// A bone's world rotation, turned the least way so that its joint below, which is at `jointBelow` in the
-/// bone's space, lies in a direction of the world.
+/// Returns the world rotation `bone`, rotated by the smallest angle that makes the bone point in `direction`
+/// (world space, any length). `jointBelow` is the position of the next joint in the bone's space.
 Mat3 PointedTo(const Vec3& direction, const Mat3& bone, const Vec3& jointBelow);
 
-/// The place of a knee or an elbow of a limb from the origin to `end`, which is within its reach: on the side
-/// of the line between them on which `side` is. Not finite where there is none: an end at the origin, a side
-/// on the line.
+/// Returns the position of the knee or elbow of a limb that goes from the origin to `end`, which must be
+/// within its reach. The joint bends toward the side of that line on which `side` is. The result is not
+/// finite if it is undefined: if `end` is the origin, or if `side` is on the line.
 Vec3 MiddleJoint(const LegLengths& limb, const Vec3& end, const Vec3& side);
 
 } // namespace gw

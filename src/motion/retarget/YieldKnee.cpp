@@ -1,22 +1,23 @@
-// What a leg does that must both reach a place and keep its knee. Its reach r at the knee's angle x is flat
-// where the leg is straight: there the angle that reaches a place exactly goes as the square root of what is
-// missing, and a foot that rocks by a millimetre jerks the knee. A spring between angle and reach does not
-// help: which of its two balances the knee takes flips at some length.
+// A leg must both reach a position and keep its knee angle. The reach r as a function of the knee's angle x
+// is flat near the straight leg. There, the angle that reaches a position exactly grows with the square root
+// of the missing length, so a foot that rocks by a millimeter jerks the knee. A spring between angle and
+// reach does not help: it has two equilibria, and the knee flips from one to the other at some length.
 //
-// So the knee goes from its own angle to the one it takes by steps of the reach, and turns for each of them
-// by no more than 1 / s for a stiffness s:
+// So the knee moves from its own angle to the result along the change in reach, and rotates by at most 1 / s
+// per unit of it, for a stiffness s:
 //
-//     dx / de = 1 / sqrt(r'(x)^2 + s^2)        e = r at its own angle - the reach asked for
+//     dx / de = 1 / sqrt(r'(x)^2 + s^2)        e = r at its own angle - the requested reach
 //
-// That is the exact angle where |r'| is large, and one that changes evenly where it is not. A knee that
-// straightens is slowed down in its last degrees: it comes near to its stop and never hits it. The curve is
-// followed by Heun's rule in a few steps; bends are small and the right side is smooth.
+// The result is the exact angle where |r'| is large, and changes evenly where it is not. A knee that
+// straightens is slowed down in its last degrees, so it approaches its stop and never hits it. The equation
+// is integrated with Heun's method in a few steps, which is enough because bends are small and the right-hand
+// side is smooth.
 //
-// With y = sin(x / 2) for the angle, and a and b for the segments, the law of cosines becomes
+// With y = sin(x / 2) instead of the angle, and a and b for the segments, the law of cosines becomes
 //
 //     r^2 = (a + b)^2 - 4 a b y^2        r' = -2 a b y sqrt(1 - y^2) / r        dy / dx = sqrt(1 - y^2) / 2
 //
-// which takes no trigonometry and keeps small angles exact.
+// which needs no trigonometry and keeps small angles exact.
 
 #include "YieldKnee.h"
 
@@ -28,11 +29,11 @@ namespace gw {
 namespace {
 
 constexpr int kSteps = 4;
-constexpr double kStopBend = 0.06;   // 7 degrees before its stop a knee begins to slow down
-constexpr double kLeastBend = 0.005; // a straighter leg is one of which rounding makes what it likes
+constexpr double kStopBend = 0.06;   // a knee slows down in the last 7 degrees before its stop
+constexpr double kLeastBend = 0.005; // below this, rounding dominates
 constexpr double kMostBend = 0.9999;
 
-// By how much a bend grows for a unit of length less.
+// Returns the change of the bend per unit of length in `direction`: 1 shortens the leg, -1 straightens it.
 double BendFor(const LegLengths& leg, double bend, double slowBelow, double stiffness, double direction)
 {
     const double turn =

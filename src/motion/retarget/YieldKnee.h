@@ -2,29 +2,29 @@
 
 namespace gw {
 
-/// A leg of two segments.
+/// The lengths of the two segments of a leg or an arm.
 struct LegLengths
 {
     double upper;
     double lower;
 };
 
-// A knee's bend is the sine of half its angle: 0 for a straight leg, 1 for one that is folded.
+// The bend of a knee is the sine of half its angle: 0 for a straight leg, 1 for a folded one.
 
-/// Millimetres a radian for knees and elbows of the target: they turn by at most 1.3 degrees for a
-/// millimetre.
+/// Stiffness of the target's knees and elbows, in millimeters per radian: they rotate by at most 1.3 degrees
+/// per millimeter.
 inline constexpr double kLimbStiffness = 45.0;
 
-/// How far hip and ankle are apart with the knee bent.
+/// Returns the distance between hip and ankle at a given bend.
 double ReachAt(const LegLengths& leg, double bend);
-/// The bend at which hip and ankle are so far apart; 0 for a reach beyond that of the straight leg.
+/// Returns the bend at which hip and ankle are `reach` apart, or 0 if the straight leg is shorter than that.
 double BendAt(const LegLengths& leg, double reach);
-/// The square of what the reach loses for a radian more of the knee's angle.
+/// Returns the square of the reach's derivative with respect to the knee's angle, per radian squared.
 double SquareSlopeAt(const LegLengths& leg, double bend);
-/// The bend that a leg takes on which is asked for a reach but should keep its own bend: the one that reaches
-/// it where the knee is bent, near to its own where it is straight, since there a little reach takes much of
-/// an angle. `stiffness` is in units of length a radian: no millimetre asked for more or less turns the knee
-/// by more than its inverse.
+/// Returns the bend of a leg that should reach `asked` but also keep its own bend. If the knee is bent, the
+/// result reaches `asked`. If it is straight, the result stays close to `bend`, because there a small change
+/// of reach takes a large angle. `stiffness` is a length per radian: each unit of length in `asked` rotates
+/// the knee by at most its inverse.
 double YieldingBend(const LegLengths& leg, double asked, double bend, double stiffness);
 
 } // namespace gw
