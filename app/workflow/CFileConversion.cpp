@@ -157,11 +157,14 @@ bool CFileConversion::Convert(bool useLegs)
     return true;
 }
 
-bool CFileConversion::WriteResult(const std::string& path)
+bool CFileConversion::WriteResult(const std::string& path, bool* taken)
 {
     CFailureRecord record;
     const bool written = WriteResultFile(result_, path, profile_.frameRate, record);
-    Notify(path, record);
+    if (taken && record.Failure().reason == EFailure::Exists)
+        *taken = true;
+    else
+        Notify(path, record);
     return written;
 }
 

@@ -37,8 +37,9 @@ public:
     bool Convert(bool useLegs);
 
     /// Replace an existing file. The first writes a package if the extension is .Kinetra; the second writes
-    /// an HTR with as many frames as a batch run.
-    bool WriteResult(const std::string& path);
+    /// an HTR with as many frames as a batch run. A file that must not be replaced, and exists by now, is a
+    /// failure, or sets `taken` instead if that is given.
+    bool WriteResult(const std::string& path, bool* taken = nullptr);
     bool WriteBatchResult(const std::string& path);
     /// Writes the source as a BVH file, re-expressed relative to a T-pose. Call it instead of Convert, with
     /// the choice `align`.

@@ -28,14 +28,14 @@ bool MakeSharedFolder(const std::string& folder)
     return IsFolderItself(folder);
 }
 
-// Another program can remove the empty folder just before the file is created.
+// Another program can remove the empty folder at any time before the file is created.
 int CreateIn(const std::string& folder, std::string& path)
 {
     constexpr int kAttempts = 8;
     for (int i = 0; i < kAttempts; ++i)
     {
         if (!MakeSharedFolder(folder))
-            break;
+            continue; // it may have been removed again at once
         path = folder + std::string(kNamePattern);
         const int file = mkostemps(path.data(), kExtensionLength, O_CLOEXEC);
         if (file >= 0)

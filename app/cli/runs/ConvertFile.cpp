@@ -87,10 +87,14 @@ public:
             return EConversion::Planned;
         if (!Convert())
             return EConversion::Failed;
-        // Another run may have made it meanwhile, such as the workers of a killed one.
-        if (options_.skipExisting && IsTaken(job_.output))
+        // Another run may have made it meanwhile, such as the workers of a killed one, and may do so until
+        // the end.
+        bool taken = options_.skipExisting && IsTaken(job_.output);
+        const bool written =
+            !taken && m_kConversion.WriteResult(job_.output, options_.skipExisting ? &taken : nullptr);
+        if (taken)
             return EConversion::Skipped;
-        if (!m_kConversion.WriteResult(job_.output) || notices_.HasFailed())
+        if (!written || notices_.HasFailed())
             return EConversion::Failed;
         if (IsMeasured())
             Check();
