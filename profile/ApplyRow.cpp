@@ -14,9 +14,9 @@ namespace {
 
 enum class ERowFit : uint8_t
 {
-    Missing, // a bone of the row is in no skeleton: nothing was set
-    Fixed,   // the target bone takes no source
-    Mapped,  // source and target are there
+    Missing, // a bone of the row is not in its skeleton; nothing was set
+    Fixed,   // the target bone has no source
+    Mapped,  // source and target were found
 };
 
 Vec3 Degrees(const RowNumbers& numbers)

@@ -8,10 +8,10 @@ class CBoneNames;
 class CMapRowTable;
 class CRetargeter;
 
-/// The target skeleton's shares, in the folder of base.htr.
+/// Name of the target skeleton's share file, in the folder of base.htr.
 inline constexpr const char* kShareFile = "KsBone.bsm";
 
-/// The number of rows, including fixed ones, and how many find their bones.
+/// The number of rows, including fixed ones, and how many of them find their bones.
 struct RowMatch
 {
     int rowCount = 0;
@@ -23,8 +23,9 @@ struct RowMatch
     bool IsWhole() const { return foundCount == rowCount && drivesRoot; }
 };
 
-/// Looks up the bones of all rows. If a retargeter is given, enters the rows with existing bones that differ
-/// from its defaults. `onMapped` is called for each row that has a source.
+/// Looks up the bones of all rows and returns how many match. If a retargeter is given, sets the values of
+/// rows with existing bones that differ from its defaults. `onMapped` is called for each row that has a
+/// source.
 RowMatch ApplyRows(const CMapRowTable& rows, const CBoneNames& sources, const CBoneNames& targets,
                    CRetargeter* retargeter, const std::function<void(int row)>& onMapped = {});
 

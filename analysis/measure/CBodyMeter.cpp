@@ -19,8 +19,8 @@ namespace gw {
 
 namespace {
 
-constexpr double kLeastTravel = 500.0; // mm; a shorter path is made of sway and noise
-constexpr double kSinkShare = 0.05;    // what sinks deeper in fewer frames is an outlier
+constexpr double kLeastTravel = 500.0; // mm; a shorter path is only sway and noise
+constexpr double kSinkShare = 0.05;    // deeper values in fewer frames than this are outliers
 
 std::vector<LegJoints> LegsOf(const std::vector<LegPair>& pairs, LegJoints LegPair::*side)
 {
@@ -29,13 +29,13 @@ std::vector<LegJoints> LegsOf(const std::vector<LegPair>& pairs, LegJoints LegPa
     return legs;
 }
 
-// A mapping may take a knee for its own ankle.
+// A bad mapping can use a knee as its own ankle.
 bool IsLength(double leg)
 {
     return std::isfinite(leg) && leg > 0.0;
 }
 
-// A foot without a toe joint takes its heading from the other side.
+// A foot without a toe joint uses the heading of the other skeleton's foot.
 void LendHeading(CLegTrack& source, CLegTrack& result)
 {
     if (!result.HasToe())
@@ -67,7 +67,7 @@ std::optional<double> CommonF1(const std::vector<FootMeasures>& feet)
     return RatioOf(2.0 * static_cast<double>(both), static_cast<double>(standing));
 }
 
-// One number of a leg's postures, frame by frame: (number - floor) x scale.
+// Returns one number of a leg's postures for each frame: (number - floor) x scale.
 std::vector<float> Curve(const CLegTrack& leg, float CLegTrack::Posture::*number, double floor = 0.0,
                          double scale = 1.0)
 {
@@ -78,11 +78,11 @@ std::vector<float> Curve(const CLegTrack& leg, float CLegTrack::Posture::*number
     return curve;
 }
 
-// Below this share of a leg an ankle stands on its floor as none does: the skeleton has no sole.
+// If the ankle is closer to its floor than this share of the leg length, the skeleton has no sole.
 constexpr double kNoSole = 0.01;
 
-// How far the floor lies under the soles of the source, where these are its ankles: as far in leg lengths as
-// under those of the result.
+// Returns how far the floor is below the source's soles if these are its ankles: as far as below the result's
+// ankles, in leg lengths.
 double DepthUnderSoles(const CFeetTrack& source, const CFeetTrack& result)
 {
     if (source.Legs()[0].AnkleHeight() > kNoSole * source.LegLength())
@@ -90,7 +90,7 @@ double DepthUnderSoles(const CFeetTrack& source, const CFeetTrack& result)
     return result.Legs()[0].AnkleHeight() / result.LegLength() * source.LegLength();
 }
 
-// The height on which the soles of a skeleton stand.
+// Returns the level on which the soles of a skeleton stand.
 double SoleFloor(const std::vector<CLegTrack>& legs)
 {
     std::vector<float> heights;
@@ -99,7 +99,7 @@ double SoleFloor(const std::vector<CLegTrack>& legs)
     return static_cast<double>(Percentile(std::move(heights), kFloorShare));
 }
 
-// The joint of a bone by its name on one side; null where it is not mapped.
+// Returns the joint of a named target bone on one side; null if it is not mapped.
 CNode* Landmark(std::span<const BonePair> pairs, std::string_view target, CNode* BonePair::*side)
 {
     const auto pair =
@@ -129,7 +129,7 @@ double PathOf(const CBodyTrack& body)
     return steps.Sum();
 }
 
-// From the first place on in x and z; above a floor in y.
+// Returns the hips' positions: x and z relative to the first frame, y above the floor.
 std::vector<Vec3> HipsFromStart(const CBodyTrack& body, double floor)
 {
     std::vector<Vec3> places;

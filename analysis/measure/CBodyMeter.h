@@ -16,21 +16,21 @@ namespace gw {
 class CPoseSampler;
 struct FootPlants;
 
-/// Feet, hips, trunk and hands of a conversion while frames go by.
+/// Measures the feet, hips, trunk and hands of a conversion frame by frame.
 class CBodyMeter
 {
 public:
-    /// Both trees are posed.
+    /// Both trees must be posed.
     CBodyMeter(std::span<const BonePair> pairs, const CSourceTable& sources);
 
     void WatchJoints(CPoseSampler& source, CPoseSampler& result) const;
-    /// Takes the present pose as that of the first frame for lengths and headings.
+    /// Uses the current pose as the first frame's, to measure lengths and headings.
     void Begin();
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Add();
-    /// Enters all figures but those of bones; none without a leg, as lengths are compared in legs. To be
-    /// called once, at the end. `secondsPerFrame` is the source's. `detail`, where there is one, takes the
-    /// curves.
+    /// Writes all figures except those of bones. Writes nothing without a leg, because lengths are compared
+    /// in leg lengths. Call it once, after the last frame. `secondsPerFrame` is the source's. `detail`,
+    /// unless null, receives the curves.
     void Write(ConversionMeasures& measures, double secondsPerFrame, ConversionDetail* detail);
 
 private:
@@ -42,16 +42,16 @@ private:
     void WriteHands(ConversionMeasures& measures, double secondsPerFrame) const;
     void WriteFeetDetail(ConversionDetail& detail, const LegPlants& source, const LegPlants& result) const;
     void WriteHipsDetail(ConversionDetail& detail) const;
-    /// How many units of the result are one of the source.
+    /// Returns the number of result units per source unit.
     double SourceScale() const { return m_kResultFeet.LegLength() / m_kSourceFeet.LegLength(); }
-    /// y on which the source stands.
+    /// Returns the y of the source's floor.
     double SourceFloor() const;
 
     std::vector<LegPair> m_kLegs;
     std::array<BonePair, 2> m_kHands{};
     CFeetTrack m_kSourceFeet;
     CFeetTrack m_kResultFeet;
-    CBodyTrack m_kSource; // in the result's size once it is complete
+    CBodyTrack m_kSource; // in the result's size after the last frame
     CBodyTrack m_kResult;
 };
 

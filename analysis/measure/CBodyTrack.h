@@ -13,27 +13,27 @@ namespace gw {
 class CNode;
 class CPoseSampler;
 
-/// The joints of one skeleton by which hips, trunk and hands are measured. Null for one that is not mapped.
+/// The joints of one skeleton by which hips, trunk and hands are measured; null if not mapped.
 struct BodyLandmarks
 {
-    std::vector<LegJoints> legs; ///< two at most
-    CNode* neck = nullptr;       ///< the head's joint where no neck is mapped
-    CNode* head = nullptr;       ///< null where it is the neck
+    std::vector<LegJoints> legs; ///< at most two
+    CNode* neck = nullptr;       ///< the head's joint if no neck is mapped
+    CNode* head = nullptr;       ///< null if it is used as the neck
     std::array<CNode*, 2> hands{};
 };
 
-/// The trunk in a pose.
+/// The trunk in one pose.
 struct TrunkLine
 {
-    Vec3 chord;  ///< from the middle of the hip joints to the neck
-    Vec3 across; ///< from the last leg's hip joint to the first one's; zero with one leg only
+    Vec3 chord;  ///< from the midpoint of the hip joints to the neck
+    Vec3 across; ///< from the last leg's hip joint to the first one's; zero with only one leg
 };
 
-/// Where these joints are, frame by frame, in world space. A list is empty where there is no such joint.
+/// The positions of these joints in each frame, in world space. The list of a missing joint is empty.
 class CBodyTrack
 {
 public:
-    /// A leg's joints, in the order of the legs.
+    /// The joints of one leg. Legs keep their order.
     struct Leg
     {
         std::vector<Vec3> hip;
@@ -44,9 +44,9 @@ public:
     explicit CBodyTrack(BodyLandmarks joints);
 
     void WatchJoints(CPoseSampler& sampler) const;
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Append();
-    /// Brings all places into another unit.
+    /// Converts all positions to another unit.
     void Scale(double factor);
 
     size_t FrameCount() const { return m_kLegs.empty() ? m_kNeck.size() : m_kLegs[0].hip.size(); }
@@ -55,9 +55,9 @@ public:
     const std::vector<Vec3>& Head() const { return m_kHead; }
     const std::vector<Vec3>& Hand(size_t side) const { return m_kHands[side]; }
 
-    /// The middle of the hip joints in a frame. There must be a leg.
+    /// Returns the midpoint of the hip joints in a frame. There must be a leg.
     Vec3 Hips(size_t frame) const;
-    /// The trunk in a frame, or in the rest pose. There must be a leg and a neck.
+    /// Returns the trunk in a frame, or in the rest pose. There must be a leg and a neck.
     TrunkLine Trunk(size_t frame) const;
     TrunkLine RestTrunk() const;
 

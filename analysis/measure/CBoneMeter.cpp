@@ -7,7 +7,7 @@
 
 namespace gw {
 
-// A posed tree has the world matrices of its nodes, and not those of the meshes.
+// Posing a tree updates the world matrices of its nodes, but not of the meshes.
 Vec3 CBoneDirection::Present() const
 {
     const Mat4& joint = m_pkJoint->m_kWorldMatrix;

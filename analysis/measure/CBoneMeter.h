@@ -13,10 +13,11 @@ class CPoseSampler;
 class CBoneDirection
 {
 public:
-    /// Without an end it is the direction of the joint's bone: +y of its bone mesh, else of its own.
+    /// Without an end joint, the direction is that of the joint's bone: +y of its bone mesh, otherwise +y of
+    /// the joint itself.
     CBoneDirection(const CNode& joint, const CNode* end) : m_pkJoint(&joint), m_pkEnd(end) {}
 
-    /// The unit direction in the present pose.
+    /// Returns the unit direction in the current pose.
     Vec3 Present() const;
 
 private:
@@ -24,18 +25,19 @@ private:
     const CNode* m_pkEnd; // null for an end joint
 };
 
-/// One pair of bones while frames go by: both have a direction, or are looked at by their bones' axes.
+/// Measures one pair of bones frame by frame. Either both have a direction between joints, or both are
+/// compared by their bones' axes.
 class CBoneMeter
 {
 public:
     CBoneMeter(const BonePair& pair, const BoneEnds& ends);
 
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Add();
     const CRunningMean& Errors() const { return m_kErrors; }
-    /// The angle of the last frame, in degrees.
+    /// Returns the angle in the last frame, in degrees.
     double LastError() const { return m_fLastError; }
-    /// Enters the figures, all but the names.
+    /// Writes the figures, but not the names.
     void Write(BoneMeasures& bone) const;
 
 private:
@@ -43,7 +45,7 @@ private:
     CBoneDirection m_kTarget;
     CRunningMean m_kErrors;
     double m_fLastError = 0.0;
-    int m_iFrame = 0; // the next one
+    int m_iFrame = 0; // next frame
     int m_iLargestFrame = 0;
 };
 

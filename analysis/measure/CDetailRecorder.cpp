@@ -12,7 +12,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kMostMainBones =
-    255; // what a byte of ConversionDetail::largestBone holds; there are a dozen
+    255; // fits in a byte of ConversionDetail::largestBone; there are about a dozen
 
 PartMeasures MeasurePart(const BodyPart& part, const std::vector<BoneMeasures>& bones)
 {

@@ -8,16 +8,16 @@
 
 namespace gw {
 
-/// Keeps what the sums of a comparison pass over: frame by frame, how far the main bones are off.
+/// Records what the summary figures leave out: the direction error of the main bones in each frame.
 class CDetailRecorder
 {
 public:
-    /// Both trees are posed. The detail and the nodes must outlive the recorder.
+    /// Both trees must be posed. The detail and the nodes must outlive the recorder.
     CDetailRecorder(ConversionDetail& detail, std::span<const BonePair> pairs, const CSourceTable& sources);
 
-    /// Takes the present pose as the next frame.
+    /// Adds the current pose as the next frame.
     void Add();
-    /// Enters the figures of the parts.
+    /// Writes the figures of the parts of the body.
     void Finish();
 
 private:
@@ -25,7 +25,7 @@ private:
     void AddErrors();
 
     ConversionDetail& detail_;
-    std::vector<CBoneMeter> m_kMeters; // of the main bones
+    std::vector<CBoneMeter> m_kMeters; // for the main bones
 };
 
 } // namespace gw

@@ -8,15 +8,16 @@ namespace gw {
 
 class CFeetTrack;
 
-/// When one foot of a skeleton stands, and when each of its joints does.
+/// The frames in which one foot of a skeleton stands, and in which each of its joints does.
 struct FootPlants
 {
     std::vector<Contact> foot;  ///< ankle and toe together; see FindContacts.h
-    std::vector<Contact> ankle; ///< the ankle, whatever the toe does
-    std::vector<Contact> toe;   ///< the toe, whatever the ankle does; none without a toe joint
+    std::vector<Contact> ankle; ///< only the ankle
+    std::vector<Contact> toe;   ///< only the toe; empty without a toe joint
 };
 
-/// The plants of each leg. A joint's floor is the height on which those of both feet stand.
+/// Returns the plants of each leg. The floor of a joint is the level on which both feet's joints of that kind
+/// stand.
 std::vector<FootPlants> FindPlants(const CFeetTrack& feet, double secondsPerFrame);
 
 } // namespace gw

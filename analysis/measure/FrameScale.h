@@ -7,8 +7,8 @@ namespace gw {
 /// counts are truncated, and let the end of a motion drift by up to a frame; it is used only if no rate fits.
 double FrameScaleOf(int sourceFrames, int resultFrames);
 
-/// Returns the number of source frames, from the first, for which a result with this scale has a pose: a
-/// truncated count can lack the last ones. Both counts must be positive.
+/// Returns the number of source frames, starting at the first, for which a result with this scale has a pose:
+/// if a count was truncated, the last ones can be missing. Both counts must be positive.
 int ComparedFrames(int sourceFrames, int resultFrames, double frameScale);
 
 } // namespace gw

@@ -10,7 +10,7 @@ namespace gw {
 namespace {
 
 constexpr double kJitterSeconds = 1.0 / 30.0;
-// A direction that stands still shakes so by rounding alone: unit directions are good to 1e-7.
+// A direction at rest has about this jitter from rounding alone: unit directions are accurate to 1e-7.
 constexpr double kStillJitter = 1e-6;
 
 } // namespace

@@ -9,12 +9,12 @@ namespace gw {
 
 class CBodyTrack;
 
-/// How much a direction shakes at 30 Hz: the mean of |d(t - s) - 2 d(t) + d(t + s)|, d being the unit
-/// direction from one joint to another and s a thirtieth of a second, over the instants t = s, 2 s, ...
-/// Between two frames, directions are interpolated. s is a frame where frames are longer than that.
+/// Returns how much a direction shakes at 30 Hz: the mean of |d(t - s) - 2 d(t) + d(t + s)| over the instants
+/// t = s, 2 s, ..., where d is the unit direction from one joint to another and s is 1/30 s, or one frame if
+/// frames are longer. Directions between two frames are interpolated.
 double JitterOf(const std::vector<Vec3>& from, const std::vector<Vec3>& to, double secondsPerFrame);
 
-/// The result's jitter by the source's for each thigh and calf that moves in the source.
+/// Returns the ratio of the result's jitter to the source's for each thigh and calf that moves in the source.
 std::vector<float> LegJitterRatios(const CBodyTrack& source, const CBodyTrack& result,
                                    double secondsPerFrame);
 

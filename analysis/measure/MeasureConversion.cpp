@@ -1,7 +1,7 @@
-// How a conversion is measured: which joints are looked at is found once, in the pose of the first frame;
-// then both trees are posed frame by frame, the looked-at joints alone, and each meter takes what it needs.
-// Bones keep running sums. The body keeps a few joints a frame, since where the floor is, and with it which
-// frames stand and what hands touch, is known at the end only.
+// Measures a conversion. The joints to measure are found once, in the pose of the first frame. Then these
+// joints are posed frame by frame in both trees, and each meter reads what it needs. Bones keep running sums.
+// The body stores a few joints per frame, because the floor is known only at the end, and with it which
+// frames stand and what the hands touch.
 
 #include "MeasureConversion.h"
 
@@ -19,7 +19,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kUsualSecondsPerFrame = 1.0 / 30.0; // where a file gives no usable one
+constexpr double kUsualSecondsPerFrame = 1.0 / 30.0; // if a file has no usable frame time
 
 BoneMeasures NamedBone(const BonePair& pair, const BoneEnds& ends)
 {
@@ -31,7 +31,7 @@ BoneMeasures NamedBone(const BonePair& pair, const BoneEnds& ends)
     return bone;
 }
 
-// Both trees are posed at their first frame before one of these is made.
+// Both trees must be posed at their first frame before a comparison is created.
 class CComparison
 {
 public:
@@ -53,10 +53,10 @@ private:
     CPoseSampler m_kSource;
     CPoseSampler m_kResult;
     std::vector<BoneMeasures> m_kBones;
-    std::vector<CBoneMeter> m_kMeters;   // of the bones that can be measured
-    std::vector<size_t> m_kMeteredBones; // which these are
+    std::vector<CBoneMeter> m_kMeters;   // for the bones that can be measured
+    std::vector<size_t> m_kMeteredBones; // the indices of these bones
     CBodyMeter m_kBody;
-    ConversionDetail* m_pkDetail; // null where nobody asks
+    ConversionDetail* m_pkDetail; // null if not requested
     std::optional<CDetailRecorder> recorder_;
 };
 

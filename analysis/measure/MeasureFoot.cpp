@@ -12,14 +12,14 @@ namespace gw {
 
 namespace {
 
-constexpr double kFlatEnough = 0.5; // a foot within 30 degrees of upright has no heading worth the name
-constexpr double kPopDegrees = 5.0; // what the eye takes for a jerk, in a walk as in a run
+constexpr double kFlatEnough = 0.5; // a foot within 30 degrees of vertical has no useful heading
+constexpr double kPopDegrees = 5.0; // a visible jerk, in a walk or a run
 constexpr double kPopSeconds = 1.0 / 30.0;
-constexpr double kPopSlack = 1.0 / 15.0; // the source's knee may bend so much earlier or later
-// Between these speeds a foot stands by one rule and does not by another, mm/s.
+constexpr double kPopSlack = 1.0 / 15.0; // the source's knee may bend this much earlier or later
+// Speeds in mm/s between which it is unclear whether a foot stands.
 constexpr double kSurelyStands = 150.0;
 constexpr double kSurelyMoves = 300.0;
-constexpr double kHalfSpeedSeconds = 1.0 / 60.0; // speeds are taken over twice as long
+constexpr double kHalfSpeedSeconds = 1.0 / 60.0; // speeds are measured over twice this time
 
 std::vector<bool> StandingFrames(const std::vector<Contact>& contacts, size_t frameCount)
 {
@@ -34,7 +34,7 @@ bool HasHeading(const Vec3& direction)
     return std::hypot(static_cast<double>(direction.x), static_cast<double>(direction.z)) >= kFlatEnough;
 }
 
-// The angle about y from one direction to another in degrees, -180 to 180.
+// Returns the angle about y from one direction to another in degrees, -180 to 180.
 double TurnBetween(const Vec3& from, const Vec3& to)
 {
     const auto yaw = [](const Vec3& v) {
@@ -115,7 +115,7 @@ std::vector<PlantSlide> AddedSlides(const FootSide& source, const FootSide& resu
     return slides;
 }
 
-// How fast the faster joint of a foot is, frame by frame, in mm of the result per second.
+// Returns the speed of a foot's faster joint for each frame, in mm of the result per second.
 std::vector<double> SpeedsOf(const FootSide& side, double secondsPerFrame)
 {
     const int span = FramesIn(kHalfSpeedSeconds, secondsPerFrame);
@@ -191,7 +191,7 @@ void MeasureKnee(const FootSide& source, const FootSide& result, double secondsP
     const std::vector<float> allowed =
         SlidingLargest(LargestChanges(KneeAngles(source.track), span), slack, slack);
     bool pops = false;
-    double worst = 0.0; // of the present pop
+    double worst = 0.0; // of the current pop
     for (size_t f = 0; f < changes.size(); ++f)
     {
         const auto excess = static_cast<double>(changes[f] - allowed[f]);

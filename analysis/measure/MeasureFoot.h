@@ -14,29 +14,29 @@ struct FootSide
 {
     const CLegTrack& track;
     const FootPlants& plants;
-    double scale; ///< the result's unit by that of the track
+    double scale; ///< result units per track unit
 };
 
-/// A joint's slide in a plant.
+/// How far a joint slides in one plant.
 struct PlantSlide
 {
     double added; ///< mm; see SlideMeasures
-    int frame;    ///< in which the result's joint is farthest off
+    int frame;    ///< frame in which the result's joint is farthest off
 };
 
-/// Everything about a foot but its names.
+/// Everything about a foot except its names.
 struct MeasuredFoot
 {
     FootMeasures figures;
-    std::vector<PlantSlide> ankleSlides; ///< one for each plant
+    std::vector<PlantSlide> ankleSlides; ///< one per plant
     std::vector<PlantSlide> toeSlides;
-    std::vector<float> heldSoles; ///< see FootMeasures::heldSole; one for each frame that the source stands
+    std::vector<float> heldSoles; ///< see FootMeasures::heldSole; one per frame in which the source stands
 };
 
-/// Both tracks have the same frames.
+/// Measures a foot. Both tracks must have the same number of frames.
 MeasuredFoot MeasureFoot(const FootSide& source, const FootSide& result, double secondsPerFrame);
 
-/// The figures of some plants.
+/// Returns the summary of a list of plants.
 SlideMeasures SummaryOf(const std::vector<PlantSlide>& slides);
 
 } // namespace gw

@@ -1,6 +1,6 @@
-// What a hand touches. A motion has joints and no skin, so that thigh, trunk, head and hand are given radii
-// of a grown body. As the same radii stand on both sides, they decide what is a touch, and not how far the
-// result is off: that is the difference of the distances from the line or point in the middle of a part.
+// Finds what a hand touches. A motion has joints but no skin, so thigh, torso, head and hand get the radii of
+// an adult body. Both sides use the same radii. These decide only what counts as a touch, not how far the
+// result is off: that is the difference between the distances from the center line or point of a part.
 
 #include "MeasureHands.h"
 
@@ -16,11 +16,12 @@ namespace gw {
 
 namespace {
 
-constexpr double kTouch = 50.0; // mm, nearer or farther than where a wrist lies on a part:
+constexpr double kTouch =
+    50.0; // mm from where a wrist lies on a part, nearer or farther; radii of the parts:
 constexpr double kThighRadius = 40.0;
 constexpr double kTorsoRadius = 60.0;
 constexpr double kHeadRadius = 70.0;
-constexpr double kHandRadius = 40.0;  // two wrists against each other
+constexpr double kHandRadius = 40.0;  // wrist against wrist
 constexpr double kFloorRadius = 30.0; // a flat hand
 constexpr float kHeadMiddle = 107.0f; // above the head's joint
 constexpr double kLeastTouchSeconds = 0.08;
@@ -46,7 +47,7 @@ public:
 private:
     using Places = std::vector<Vec3>;
 
-    // `distance` is that of the hand's place from the part, given a body and a frame.
+    // `distance` returns the hand's distance from the part, given a body and a frame.
     template <class Distance>
     void AddPart(const char* name, double radius, const Distance& distance);
     void AddBody();
@@ -110,8 +111,8 @@ void CHandMeter::AddBody()
         });
 }
 
-// The middle of the head lies where the result's neck leads to, on both sides: how a head is turned is
-// measured as a direction.
+// On both sides, the center of the head is where the result's neck points: the head's rotation is measured as
+// a direction instead.
 void CHandMeter::AddHead()
 {
     if (sides_.source.Head().empty() || sides_.result.Head().empty())

@@ -9,7 +9,8 @@ namespace gw {
 
 class CBodyTrack;
 
-/// A source's body in the result's size, and the result's. Both tracks have the same frames; lengths are mm.
+/// The source's body in the result's size, and the result's body. Both tracks have the same number of frames;
+/// lengths are in mm.
 struct HandSides
 {
     const CBodyTrack& source;
@@ -18,7 +19,8 @@ struct HandSides
     double secondsPerFrame;
 };
 
-/// All figures of a hand but its names. `side` is that of CBodyTrack::Hand; both bodies have this hand.
+/// Returns all figures of a hand except its names. `side` is an index as for CBodyTrack::Hand; both bodies
+/// must have this hand.
 HandMeasures MeasureHand(const HandSides& sides, size_t side);
 
 } // namespace gw

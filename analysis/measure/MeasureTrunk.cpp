@@ -7,16 +7,16 @@ namespace gw {
 
 namespace {
 
-// A difference beyond this comes from a rest pose in which nobody stands, and not from proportions.
+// A larger difference is caused by a rest pose that is not a standing pose, not by proportions.
 constexpr double kMostRestDegrees = 30.0;
 
-// A direction in a trunk's own axes: y along its line, x along the hips.
+// Returns a direction in the trunk's own axes: y along its line, x along the hips.
 Vec3 InTrunk(const TrunkLine& trunk, const Vec3& direction)
 {
     return Turned(direction, TurnUpright(trunk.chord, Vec3Normalized(trunk.across)));
 }
 
-// Where the result's line is in the source's trunk when both rest.
+// Returns the direction of the result's line relative to the source's trunk when both are at rest.
 Vec3 RestChord(const CBodyTrack& source, const CBodyTrack& result)
 {
     const Vec3 chord = Vec3Normalized(InTrunk(source.RestTrunk(), result.RestTrunk().chord));

@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kMostFrames = 1e6; // some files have frames of no length
+constexpr double kMostFrames = 1e6; // some files have frames of zero length
 
 } // namespace
 
@@ -19,7 +19,7 @@ int FramesIn(double seconds, double secondsPerFrame)
     return std::max(1, static_cast<int>(std::lround(std::min(seconds / secondsPerFrame, kMostFrames))));
 }
 
-// The queue holds the values that may still be the largest: each is followed by smaller ones only.
+// The queue holds the values that can still become the largest: each is followed only by smaller ones.
 std::vector<float> SlidingLargest(std::span<const float> values, int before, int after)
 {
     const auto count = static_cast<std::ptrdiff_t>(values.size());

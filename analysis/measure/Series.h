@@ -5,20 +5,22 @@
 
 namespace gw {
 
-/// Of figures by frames, the share below which none is an outlier: what is reported is this percentile.
+/// The percentile that is reported as the usual maximum of a figure over frames; values above it count as
+/// outliers.
 inline constexpr double kMostShare = 0.95;
 
-/// The number of frames nearest to a time, at least 1.
+/// Returns the number of frames closest to a time, at least 1.
 int FramesIn(double seconds, double secondsPerFrame);
 
-/// For each value the largest one from `before` places ahead of it to `after` places behind it. Takes time in
-/// proportion to the number of values, whatever the window.
+/// Returns, for each value, the largest value in a window from `before` positions before it to `after`
+/// positions after it. Runs in time proportional to the number of values, whatever the window.
 std::vector<float> SlidingLargest(std::span<const float> values, int before, int after);
 
-/// For each value the largest difference from one of the `before` values ahead of it, 0 and above.
+/// Returns, for each value, the largest absolute difference from one of the `before` values before it.
 std::vector<float> LargestChanges(std::span<const float> values, int before);
 
-/// The middle one of the finite values, or the mean of the two in the middle; 0 without values.
+/// Returns the median of the finite values, which is the mean of the middle two for an even count; 0 without
+/// values.
 double Median(std::vector<float> values);
 
 } // namespace gw

@@ -12,14 +12,14 @@ namespace {
 
 constexpr double kSecondsApart = 0.5;
 
-// What the eye lets pass in a single frame, by EFrameFault: degrees, mm.
+// The largest values that are not visible in a single frame, by EFrameFault: degrees or mm.
 constexpr double kPassing[] = {
     5.0,  // Direction
     5.0,  // Trunk
     5.0,  // KneePop
     15.0, // AnkleSlide
     15.0, // ToeSlide
-    15.0, // HeldSole: a foot that lands or leaves is off the floor by a little
+    15.0, // HeldSole: a foot that lands or lifts off is slightly off the floor
     30.0, // HandGap
     20.0, // HandDepth
 };
@@ -41,8 +41,8 @@ WorstFrame DirectionFault(const ConversionDetail& detail, size_t frame)
             {}};
 }
 
-// Adds the frame of the largest direction error that is far enough from all that stand. False where there is
-// none.
+// Adds the frame with the largest direction error that is far enough from all added ones. Returns false if
+// there is none.
 bool AddNextDirection(const ConversionDetail& detail, std::vector<WorstFrame>& worst)
 {
     const double frames = kSecondsApart / detail.secondsPerFrame;
@@ -114,7 +114,7 @@ void AddHands(const std::vector<HandMeasures>& hands, std::vector<WorstFrame>& w
     }
 }
 
-// Of two sides with one fault, the worse one is left.
+// If both sides have the same fault, keeps only the worse one.
 void KeepWorstOfEach(std::vector<WorstFrame>& worst)
 {
     std::vector<WorstFrame> kept;

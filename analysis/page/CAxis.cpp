@@ -24,7 +24,7 @@ double RoundStep(double range, int count)
 
 CAxis::CAxis(double least, double largest, int count)
 {
-    // Curves are 32-bit: a range below their rounding is that of a constant curve.
+    // Curves are 32-bit: a range below their rounding error is treated as a constant curve.
     const double smallest = std::max(1e-6 * std::max(std::fabs(least), std::fabs(largest)), 1e-3);
     if (largest - least < smallest)
     {

@@ -11,20 +11,20 @@ namespace gw {
 class CMarkup;
 class CPagePart;
 
-/// One self-contained page about conversions: it needs no script, no other file and no network. A page about
-/// several begins with a table of them, the worst one first.
+/// A self-contained page about conversions: it needs no scripts, no other files and no network. A page about
+/// several conversions begins with a table of them, worst first.
 class CConversionPage
 {
 public:
-    /// Takes a conversion in that was drawn.
+    /// Adds a conversion whose part has been drawn.
     void Add(const std::string& source, const CPagePart& part);
-    /// Takes in a source of which there is nothing to show; `outcome` is said in the table.
+    /// Adds a source without figures to show; `outcome` is its text in the table.
     void AddWithoutFigures(const std::string& source, const std::string& outcome);
 
-    /// Whether any conversion was taken in with its figures.
+    /// Returns whether any conversion with figures was added.
     bool HasConversions() const { return m_uiSections > 0; }
 
-    /// Writes the page in one step; false leaves what is there as it was.
+    /// Replaces the page atomically. Returns false, leaving an existing file unchanged, if that fails.
     bool Write(const std::string& path);
 
 private:

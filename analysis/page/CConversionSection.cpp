@@ -21,15 +21,15 @@ std::vector<std::string> NamesOf(const std::vector<BoneMeasures>& bones, std::st
     return names;
 }
 
-// What a fault's sentence says around its amount. Without a beginning the sentence begins with the amount.
+// The text around a fault's bone name and amount. All of it may be empty.
 struct FaultSentence
 {
-    std::string_view before; // ahead of the bone's name
-    std::string_view after;  // between name and amount
+    std::string_view before; // before the bone's name
+    std::string_view after;  // between the name and the amount
     std::string_view end;
 };
 
-// By EFrameFault; a direction has two amounts.
+// Indexed by EFrameFault. A direction has two amounts and its own code.
 constexpr FaultSentence kFaults[] = {
     {"",                       "",                             ""                                     },
     {"the line from hips to ", " leans ",                      "° away from the source's"            },
@@ -55,7 +55,7 @@ void AppendFault(CMarkup& page, const WorstFrame& worst)
         page.Raw(": ").Raw(worst.part);
 }
 
-// The size of the source for pictures; without legs on both sides it stands as large as it is.
+// Returns the scale of the source in drawings: the ratio of the leg lengths, or 1 if a side has no legs.
 double SourceScale(const ConversionMeasures& sums)
 {
     return sums.sourceLeg > 0.0 && sums.resultLeg > 0.0 ? sums.resultLeg / sums.sourceLeg : 1.0;

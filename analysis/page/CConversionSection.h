@@ -11,15 +11,15 @@
 
 namespace gw {
 
-/// The part of a page that tells of one conversion: key figures, worst frames, curves, tables.
+/// The section of a page about one conversion: key figures, worst frames, curves, tables.
 class CConversionSection
 {
 public:
-    /// The conversion must outlive the section, and its trees are posed anew. Curves are drawn in at most
+    /// The conversion must outlive the section, and its trees are posed again. Curves are drawn with at most
     /// about `mostPoints` points.
     CConversionSection(const ConvertedMotion& motion, size_t mostPoints);
 
-    /// Appends the section, which links find under `anchor`.
+    /// Appends the section; `anchor` is its link target.
     void Append(CMarkup& page, const std::string& anchor);
 
 private:
@@ -35,7 +35,7 @@ private:
     const ConvertedMotion& motion_;
     size_t m_uiMostPoints;
     std::vector<WorstFrame> m_kWorst;
-    std::vector<ChartMark> m_kMarks; // where these are
+    std::vector<ChartMark> m_kMarks; // the positions of the worst frames
 };
 
 } // namespace gw

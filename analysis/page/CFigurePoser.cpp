@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kMostJoints = 1000; // includes detailed hands and faces; more would only be a tangle
+constexpr size_t kMostJoints = 1000; // enough for detailed hands and faces; more would only be a tangle
 
 std::vector<CNode*> PathTo(CNode* node)
 {
@@ -43,7 +43,7 @@ bool IsFinite(const Vec3& v)
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
 }
 
-// Returns the end of a bone that has no joint there.
+// Returns the end of a bone without an end joint.
 std::optional<Vec3> FreeEnd(const CNode& node)
 {
     const CBoneMesh* mesh = FindBoneMesh(node);

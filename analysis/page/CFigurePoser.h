@@ -17,24 +17,23 @@ struct PosedFigure
     using Line = std::array<Vec3, 2>;
 
     std::vector<Line> lines;
-    std::vector<Line> badLines; ///< bones concerned by a fault
+    std::vector<Line> badLines; ///< bones involved in a fault
     std::optional<Vec3> badJoint;
-    Vec3 root = kVec3Zero; ///< position of the body's uppermost joint
+    Vec3 root = kVec3Zero; ///< position of the body's topmost joint
 };
 
 /// Poses one side of a conversion for drawings.
 class CFigurePoser
 {
 public:
-    /// `bones` are the mapped bones' names: nodes above all of them are not part of the body and not drawn.
-    /// The clip's tree must outlive the poser.
+    /// `bones` are the names of the mapped bones. Nodes above all of them are not part of the body and are
+    /// not drawn. The clip's tree must outlive the poser.
     CFigurePoser(const MotionClip& clip, const std::vector<std::string>& bones);
 
-    /// Returns the figure at a frame, which can lie between two keys. `bone` is the name of the fault's bone
-    /// on this side.
+    /// Returns the figure at a frame, which may be between two keys. `bone` is the name of the faulty bone on
+    /// this side.
     PosedFigure Pose(double frame, EFrameFault fault, const std::string& bone);
-    /// Returns the horizontal direction from the figure's right hip to its left one in the last pose; +x
-    /// without hips.
+    /// Returns the horizontal direction from the right hip to the left hip in the last pose; +x without hips.
     Vec3 Across(const std::string& rightThigh, const std::string& leftThigh) const;
 
 private:

@@ -35,7 +35,7 @@ std::string_view EscapeOf(char c)
 
 CMarkup& CMarkup::Name(std::string_view name)
 {
-    // A character that is cut in two is shown as bytes.
+    // If cutting splits a character, its bytes are shown as \xNN.
     for (const char c : Printable(name.substr(0, kLongestName)))
     {
         const std::string_view escape = EscapeOf(c);

@@ -14,7 +14,7 @@ public:
         m_kText += markup;
         return *this;
     }
-    /// Appends a name from a file as text or inside a quoted attribute: markup is escaped, control characters
+    /// Appends a name from a file as text or inside a quoted attribute. Markup is escaped, control characters
     /// and bytes that are not UTF-8 become \xNN, and very long names are cut.
     CMarkup& Name(std::string_view name);
     /// Appends the file name of a path, with the whole path in its tool tip.

@@ -13,8 +13,8 @@ namespace gw {
 
 namespace {
 
-// Points per curve: at most two per pixel of a wide screen, and with many motions few enough that a thousand
-// of them make some dozen megabytes.
+// Points per curve: at most two per pixel of a wide screen. With many motions there are fewer, so that a
+// thousand motions take only a few dozen megabytes.
 constexpr size_t kMostPoints = 2000;
 constexpr size_t kLeastPoints = 200;
 constexpr size_t kPointsOfPage = 40000;

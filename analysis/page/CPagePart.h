@@ -8,16 +8,16 @@ namespace gw {
 
 struct ConvertedMotion;
 
-/// The page's content for one conversion. It is created where the conversion's trees are, and can be sent to
-/// the page as text from another process.
+/// The page's content for one conversion. It is created in the process that has the conversion's trees, and
+/// can be sent as text to the process that writes the page.
 class CPagePart
 {
 public:
-    /// `number` identifies the conversion on the page, starting at 1. `motionCount` is the total number: the
-    /// more, the coarser the curves, so that a browser can open the page.
+    /// `number` identifies the conversion on the page, starting at 1. `motionCount` is the total number of
+    /// conversions: the more there are, the coarser the curves, so that a browser can still open the page.
     CPagePart(size_t number, size_t motionCount);
 
-    /// Draws a conversion; its trees are posed.
+    /// Draws a conversion. Its trees are posed again.
     void Show(const ConvertedMotion& motion);
 
     /// Returns whether a conversion was drawn.
@@ -26,12 +26,12 @@ public:
     const std::string& Row() const { return m_kRow; }
     /// Returns the section about the conversion.
     const std::string& Section() const { return m_kSection; }
-    /// Returns how bad the conversion is compared with others: larger is worse.
+    /// Returns a score for ranking conversions: larger is worse.
     double Badness() const { return m_fBadness; }
 
     /// Returns the part as text for FromText; empty for one without figures.
     std::string ToText() const;
-    /// Restores a part; false for any other text.
+    /// Restores a part from ToText. Returns false for any other text.
     bool FromText(std::string_view text);
 
 private:

@@ -1,5 +1,5 @@
-// A chart scales with the page: its lines keep their width, and the numbers on its axes are text of the page,
-// so they keep their size on phones and wide screens alike.
+// Charts scale with the page. Lines keep their width, and the numbers on the axes are page text, so they have
+// the same size on phones and wide screens.
 
 #include "Chart.h"
 
@@ -145,7 +145,7 @@ private:
             page_.Number(tick, m_kHeight.Decimals()).Raw("</span>");
         }
     }
-    // The axis ends at a round number, which can be after the motion's end.
+    // The axis ends at a round number, which may be after the end of the motion.
     void LabelFrames()
     {
         for (const double tick : CAxis(0.0, m_fLastFrame, kFrameSteps).Ticks())

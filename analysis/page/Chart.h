@@ -28,7 +28,7 @@ struct ChartStrip
     std::span<const Contact> stretches;
 };
 
-/// A frame that is one of the page's worst frames, with its number there.
+/// A frame that is one of the page's worst frames, with its number in that list.
 struct ChartMark
 {
     int frame;
@@ -46,7 +46,8 @@ struct Chart
     bool fromZero = false; ///< include 0 on the axis, whatever the curves' range is
 };
 
-/// Appends a chart; nothing if no curve has a frame. Curves are drawn with at most about `mostPoints` points.
+/// Appends a chart; nothing if no curve has any frames. Curves are drawn with at most about `mostPoints`
+/// points.
 void AppendChart(CMarkup& page, const Chart& chart, size_t mostPoints);
 
 } // namespace gw

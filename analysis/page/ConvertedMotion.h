@@ -15,7 +15,7 @@ struct MeasuredConversion
     ConversionDetail detail;
 };
 
-/// A conversion for a page. Referenced objects must exist while the page reads it.
+/// A conversion to be shown on a page. Referenced objects must outlive it.
 struct ConvertedMotion
 {
     std::string source; ///< paths, as given by the user

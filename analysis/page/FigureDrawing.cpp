@@ -40,7 +40,7 @@ void EachPoint(const FigurePair& pair, const Visit& visit)
     }
 }
 
-// A view of the figures. The origin, on the floor under their roots, is always visible.
+// A view of the figures. The origin, on the floor below their roots, is always visible.
 struct Look
 {
     Vec3 right; ///< horizontal unit vector

@@ -6,7 +6,7 @@ namespace gw {
 
 class CMarkup;
 
-/// The same moment on both sides.
+/// The poses of both sides at the same instant.
 struct FigurePair
 {
     PosedFigure source;
@@ -14,12 +14,12 @@ struct FigurePair
     Vec3 across; ///< horizontal unit vector toward the body's left
 };
 
-/// Moves a figure so that drawings of both sides are comparable: above the origin, on the floor, scaled to
-/// the result.
+/// Moves a figure so that drawings of both sides can be compared: above the origin, on the floor, and scaled
+/// to the result.
 void PlaceFigure(PosedFigure& figure, double floor, double scale);
 
 /// Appends four drawings: source and result from the front, then both from the figure's right side, all with
-/// one scale and the floor. Nothing if the figures have no extent.
+/// the same scale and the floor. Appends nothing if the figures have no extent.
 void AppendFigures(CMarkup& page, const FigurePair& pair);
 
 } // namespace gw

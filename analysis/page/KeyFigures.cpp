@@ -16,13 +16,13 @@ namespace {
 
 using Optional = std::optional<double>;
 
-// What a figure is held against.
+// The ideal value of a figure.
 enum class EIdeal : uint8_t
 {
-    Least,   // the smaller the better
-    Largest, // the larger the better
-    Zero,    // the nearer to 0
-    One,     // the nearer to 1
+    Least,   // smaller is better
+    Largest, // larger is better
+    Zero,    // closer to 0 is better
+    One,     // closer to 1 is better
 };
 
 Optional DirectionError(const ConversionMeasures&, const ConversionDetail& detail)
@@ -33,7 +33,7 @@ Optional DirectionError(const ConversionMeasures&, const ConversionDetail& detai
     return errors.Count() > 0 ? Optional(errors.Mean()) : std::nullopt;
 }
 
-// The worse one of the feet.
+// Returns the worse of the two feet.
 template <auto Figure>
 Optional OfFeet(const ConversionMeasures& measures, const ConversionDetail&)
 {
@@ -52,7 +52,7 @@ double TiltOf(const FootMeasures& foot)
     return std::max(0.0, foot.soleTiltMean - foot.sourceSoleTiltMean);
 }
 
-// Nothing where no joint is ever planted.
+// Returns no value if no joint is ever planted.
 template <SlideMeasures ConversionMeasures::*slide, double SlideMeasures::*figure>
 Optional Slide(const ConversionMeasures& measures, const ConversionDetail&)
 {
@@ -85,8 +85,8 @@ struct KeyRow
     std::string_view unit;
     int decimals;
     EIdeal ideal;
-    double good; // the last figure that is good
-    double fair; // the last one that is fair
+    double good; // limit of good figures
+    double fair; // limit of fair figures
     Optional (*value)(const ConversionMeasures&, const ConversionDetail&);
     std::string_view meaning;
 };
@@ -134,7 +134,7 @@ constexpr KeyRow kRows[] = {
 };
 // clang-format on
 
-// How far a figure is from the ideal, so that less is better.
+// Returns how far a figure is from its ideal: smaller is better.
 double Distance(EIdeal ideal, double value)
 {
     switch (ideal)
@@ -213,7 +213,7 @@ std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const Co
 double BadnessOf(const std::vector<KeyFigure>& figures)
 {
     constexpr double kPoor = 1e6;
-    constexpr double kFair = 1e3; // above 180 degrees, the most that the first figure can be
+    constexpr double kFair = 1e3; // more than 180 degrees, the maximum of the first figure
     const auto poor = std::ranges::count(figures, EVerdict::Poor, &KeyFigure::verdict);
     const auto fair = std::ranges::count(figures, EVerdict::Fair, &KeyFigure::verdict);
     const double first = figures.empty() ? 0.0 : figures[0].value.value_or(0.0);

@@ -13,44 +13,45 @@ class CMarkup;
 struct ConversionDetail;
 struct ConversionMeasures;
 
-/// How a figure stands against its mark.
+/// How a figure compares with its limits.
 enum class EVerdict : uint8_t
 {
     Good,
     Fair,
     Poor,
-    None, ///< the motion does not have what the figure tells of
+    None, ///< the motion does not have the feature that is measured
 };
 
-/// One of the figures by which a conversion is judged at a glance.
+/// One of the figures that summarize the quality of a conversion.
 struct KeyFigure
 {
-    std::string_view key; ///< among the members of a record
+    std::string_view key; ///< member name in a record
     std::string_view label;
-    std::string_view unit; ///< "°", " mm" or nothing
+    std::string_view unit; ///< "°", " mm" or empty
     int decimals = 0;
     std::optional<double> value;
     EVerdict verdict = EVerdict::None;
-    std::string mark;         ///< what is good and what is fair, in words
-    std::string_view meaning; ///< a sentence
+    std::string mark;         ///< text of the limits for good and fair
+    std::string_view meaning; ///< explanation, one sentence
 };
 
-/// How many there are.
+/// Returns the number of key figures.
 size_t KeyFigureCount();
-/// All of them, always as many and in the same order.
+/// Returns all key figures, always the same ones in the same order.
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail);
 
-/// How bad a conversion is beside others: larger is worse. Poor figures weigh more than any number of fair
-/// ones, and these more than the first figure's value.
+/// Returns a score for ranking conversions: larger is worse. One poor figure outweighs any number of fair
+/// ones, and one fair figure outweighs the value of the first figure.
 double BadnessOf(const std::vector<KeyFigure>& figures);
 
-/// "Good", and a sign before it whose shape says the same: not by colour alone.
+/// Returns the verdict as text ("Good") after a sign whose shape shows it too, so that it does not depend on
+/// color alone.
 std::string_view VerdictWord(EVerdict verdict);
 std::string_view VerdictSign(EVerdict verdict);
-/// The verdict's class in the page's style.
+/// Returns the verdict's class in the style sheet.
 std::string_view VerdictClass(EVerdict verdict);
 
-/// The number with its unit, or "none".
+/// Appends the number with its unit, or "none".
 void AppendFigure(CMarkup& page, const KeyFigure& figure);
 
 } // namespace gw

@@ -15,7 +15,7 @@ namespace {
 
 constexpr double kPathWidth = 300.0;
 constexpr double kPathHeight = 130.0;
-constexpr double kLeastExtent = 100.0; // mm: who stands still sways, and this is no walk
+constexpr double kLeastExtent = 100.0; // mm; someone who stands only sways, which should not look like a walk
 
 struct PathRange
 {
@@ -33,12 +33,12 @@ struct PathRange
     double Extent() const { return largest - least; }
 };
 
-// Where the ground lies in the drawing.
+// Maps the ground to the drawing.
 struct Ground
 {
     PathRange x;
     PathRange z;
-    double scale = 0.0; // drawing to mm
+    double scale = 0.0; // drawing units per mm
 
     explicit Ground(std::initializer_list<const std::vector<Vec3>*> ways)
     {
@@ -80,7 +80,7 @@ void AppendWay(CMarkup& page, const Ground& ground, const std::vector<Vec3>& way
     page.Raw("\" cy=\"").Number(ground.Y(way.front()), 1).Raw("\"/>");
 }
 
-// A line of a round length at the bottom, and how long it is.
+// Appends a scale bar with a round length at the bottom, and its length.
 void AppendScale(CMarkup& page, const Ground& ground)
 {
     const std::vector<double> ticks = CAxis(0.0, kPathWidth / ground.scale, 5).Ticks();

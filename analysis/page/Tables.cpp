@@ -12,9 +12,10 @@ namespace gw {
 
 namespace {
 
-constexpr double kFullBar = 30.0; // degrees at which a bar fills its cell
+constexpr double kFullBar = 30.0; // degrees for a full-width bar
 
-// Columns of words, the mean error, that of the plain rules where there is one, and the other numbers.
+// Begins a table: text columns, the mean error, the mean error of the default conversion if there is one, and
+// the other numbers.
 void BeginTable(CMarkup& page, std::initializer_list<std::string_view> words,
                 std::initializer_list<std::string_view> numbers, bool hasPlain)
 {
@@ -42,7 +43,7 @@ void NumberCell(CMarkup& page, double value, int decimals)
     page.Raw("<td>").Number(value, decimals).Raw("</td>");
 }
 
-// A number with a bar before it, so that the eye finds the large ones.
+// Appends a number after a bar, so that large ones stand out.
 void BarCell(CMarkup& page, double degrees)
 {
     const double share = std::isfinite(degrees) ? std::clamp(degrees / kFullBar, 0.0, 1.0) : 1.0;
@@ -67,7 +68,7 @@ const PartMeasures* PartOf(const MeasuredConversion& measured, std::string_view 
     return part == measured.detail.parts.end() ? nullptr : &*part;
 }
 
-// The column of the plain rules keeps its place where these have no such figure.
+// Appends the cell of the default conversion; the column remains if there is no such figure.
 template <class Record>
 void PlainCell(CMarkup& page, const Record* record)
 {
@@ -77,7 +78,7 @@ void PlainCell(CMarkup& page, const Record* record)
         page.Raw("<td></td>");
 }
 
-// Rows of the tables of feet and hands. A cell is what its function appends.
+// A row of the tables of feet and hands. The function appends a cell's content.
 template <class Record>
 struct RecordRow
 {
@@ -91,7 +92,7 @@ void One(CMarkup& page, const FootMeasures& foot)
     page.Number(static_cast<double>(foot.*member), decimals);
 }
 
-// A figure and that of the source behind it.
+// Appends a figure, followed by the source's.
 template <auto member, auto sourceMember, int decimals>
 void Both(CMarkup& page, const FootMeasures& foot)
 {
@@ -129,7 +130,7 @@ void LargestSlide(CMarkup& page, const SlideMeasures& slide)
     page.Number(slide.largest, 2).Raw(" <small>frame ").Integer(slide.largestFrame).Raw("</small>");
 }
 
-// Only the first figure has something to say of a joint that is never planted.
+// For a joint that is never planted, only the number of plants is a figure; the others are "none".
 template <SlideMeasures FootMeasures::*slide, void (*append)(CMarkup&, const SlideMeasures&)>
 void Slides(CMarkup& page, const FootMeasures& foot)
 {
@@ -141,7 +142,7 @@ void Slides(CMarkup& page, const FootMeasures& foot)
 
 using Foot = FootMeasures;
 
-// Rows are calls, which the formatter leaves as they are read.
+// Rows are function calls, because the formatter keeps their layout.
 constexpr RecordRow<FootMeasures> FootRow(std::string_view label,
                                           void (*append)(CMarkup&, const FootMeasures&))
 {
@@ -202,7 +203,7 @@ constexpr RecordRow<HandMeasures> kHandRows[] = {
     {"below floor, mm",   Depth     },
 };
 
-// A row for each figure and a column for each foot or hand; nothing without any.
+// Appends a table with one row per figure and one column per foot or hand; nothing if there are none.
 template <class Record, size_t count>
 void AppendRecordTable(CMarkup& page, std::string_view title, const std::vector<Record>& records,
                        const RecordRow<Record> (&rows)[count])

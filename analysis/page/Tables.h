@@ -5,11 +5,12 @@ namespace gw {
 class CMarkup;
 struct MeasuredConversion;
 
-/// Appends how the parts of the body point; with a column for the plain rules where there are such figures.
+/// Appends the direction errors of the parts of the body, with a column for the default conversion if `plain`
+/// is given.
 void AppendPartTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain);
-/// The same bone by bone.
+/// Appends the same for each bone.
 void AppendBoneTable(CMarkup& page, const MeasuredConversion& measured, const MeasuredConversion* plain);
-/// Appends what feet and hands do, a column each; nothing where none is mapped.
+/// Appends the figures of feet and hands, one column each; nothing if none is mapped.
 void AppendFeetAndHands(CMarkup& page, const MeasuredConversion& measured);
 
 } // namespace gw

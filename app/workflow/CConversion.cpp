@@ -27,8 +27,8 @@ namespace gw {
 
 namespace {
 
-// Divides rows by their lengths and multiplies them again, because results have always been computed that
-// way. A row of length 0 is not changed.
+// Divides rows by their lengths and multiplies them again, because existing results were computed that way. A
+// row of length 0 is not changed.
 void RebuildRows(Mat4& matrix)
 {
     const Vec3 lengths = RowLengths(matrix);
@@ -42,8 +42,8 @@ void RebuildRows(Mat4& matrix)
     }
 }
 
-// An aligned copy takes as many keys as the source's tracks hold, and a container can claim any end time
-// without containing a byte for it.
+// An aligned copy needs as many keys as the source's tracks contain, and a container can claim any end time
+// without storing a byte for it.
 constexpr size_t kAnyKeyCount = size_t{1} << 22;
 
 size_t KeysHeld(const std::vector<CNode*>& joints)
@@ -58,7 +58,7 @@ size_t KeysHeld(const std::vector<CNode*>& joints)
     return keys;
 }
 
-// Returns the number of frames, or 0 and a failure if the source cannot have that many.
+// Returns the number of frames. If the source cannot have that many, records a failure and returns 0.
 int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
 {
     const std::vector<CNode*> joints = NodesOf(root);
@@ -70,7 +70,7 @@ int FramesOf(const SourceTiming& timing, CNode& root, CFailureRecord& record)
     return 0;
 }
 
-// Returns whether an alignment corrects the problem that a reader warns about.
+// Returns whether alignment corrects the problem that a reader warns about.
 bool IsAligned(EFailure reason)
 {
     return reason == EFailure::RestPose || reason == EFailure::DoubledOffsets;
@@ -149,7 +149,7 @@ void CConversion::Run(bool useLegs, const std::function<void(size_t, size_t)>& p
     NormalizeBasePose();
 }
 
-// Moves the rest pose's root to the start of the motion's root; rotation and scale do not change.
+// Moves the root of the rest pose to the start of the motion's root; rotation and scale do not change.
 void CConversion::NormalizeBasePose()
 {
     CNode* const root = FindBone(target_.restRoot.Get(), kRootBone);
@@ -174,8 +174,8 @@ void CConversion::NotifyOfMisfit()
     notify_(MakeNotice(input_.profilePath, {reason}));
 }
 
-// Notifies of the rows that name missing bones; returns false if there are none. Line numbers are included if
-// the profile is unchanged from its file.
+// Sends notices about rows that name missing bones; returns false if there are none. Line numbers are
+// included if the profile has not been edited since it was read.
 bool CConversion::NotifyOfMissingBones()
 {
     CNode* const target = target_.motionRoot.Get();

@@ -1,4 +1,4 @@
-// The steps of a conversion from file to file. Each step reports what went wrong before it returns false.
+// The steps of a file-to-file conversion. Each step reports what went wrong before it returns false.
 
 #include "CFileConversion.h"
 
@@ -47,7 +47,8 @@ bool CFileConversion::LoadSource(const std::string& path)
     if (!isScene_)
         sourceRecord_ = motion_.Record();
     else if (loaded)
-        AttachBoneMeshes(SourceRoot()); // as for motion files, because they define the bones' directions
+        AttachBoneMeshes(
+            SourceRoot()); // as for motion files, because bone meshes define the bones' directions
     Notify(path, sourceRecord_);
     if (!loaded)
         TellMessage(kInvalidSourceMessage);
@@ -98,7 +99,7 @@ bool CFileConversion::HasFrames() const
     return hasFrames;
 }
 
-// A number outside its limits is used anyway.
+// Warns only: a number outside its limits is used anyway.
 void CFileConversion::WarnOfNumbers() const
 {
     const auto warn = [&](int number, int low, int high, size_t line, const std::string& name) {

@@ -12,44 +12,44 @@
 
 namespace gw {
 
-/// The code of a notice that is one of the program's fixed messages: "Invalid BVH file format."
+/// The code of a notice with one of the program's fixed messages: "Invalid BVH file format."
 inline constexpr const char* kFixedMessage = "message";
 
 /// Converts files without a window. The steps are LoadSource and LoadTarget, UseProfile, Convert, and one of
-/// the writing functions; each requires the previous one to have returned true. A function that fails sends a
+/// the writing functions; each requires that the previous one returned true. A function that fails sends a
 /// notice first. Leaves no settings or folders behind.
 class CFileConversion
 {
 public:
-    /// An empty data folder means the program's own.
+    /// An empty data folder means the program's own folder.
     CFileConversion(const std::string& dataFolder, const ConversionChoices& choices, NoticeListener listener);
 
     bool LoadSource(const std::string& path);
-    /// Reads the base skeleton, as needed for each conversion.
+    /// Reads the base skeleton. Each conversion needs a new one.
     bool LoadTarget();
     bool UseProfile(const std::string& path);
-    /// Uses a profile that has been read or derived.
+    /// Uses a profile that has already been read or derived.
     void UseProfile(const std::string& path, const ProfileRows& profile);
-    /// Reads the current profile again; if its file is gone, the profile is unchanged.
+    /// Reads the current profile's file again; if it is gone, the profile is unchanged.
     void RereadProfile() { ReadProfileRows(profilePath_, profile_); }
     /// Returns whether the source, or after Convert the result, has frames.
     bool HasFrames() const;
     bool Convert(bool useLegs);
 
-    /// Replace an existing file. The first writes a package if the extension is .Kinetra; the second writes
-    /// an HTR with as many frames as a batch run. A file that must not be replaced, and exists by now, is a
-    /// failure, or sets `taken` instead if that is given.
+    /// Both replace an existing file. WriteResult writes a package if the extension is .Kinetra,
+    /// WriteBatchResult an HTR with as many frames as a batch run. A file that must not be replaced, and
+    /// exists by now, is a failure, or sets `taken` instead if that is given.
     bool WriteResult(const std::string& path, bool* taken = nullptr);
     bool WriteBatchResult(const std::string& path);
     /// Writes the source as a BVH file, re-expressed relative to a T-pose. Call it instead of Convert, with
-    /// the choice `align`.
+    /// the option `align`.
     bool WriteAligned(const std::string& path);
 
     CNode* SourceRoot() const;
     SourceTiming Timing() const;
-    /// Returns what the last conversion read: the source, or its aligned copy.
+    /// Returns what drove the last conversion: the source, or its aligned copy.
     CNode* DrivingRoot() const;
-    /// Returns the target, or the result once converted.
+    /// Returns the target, or the result after Convert.
     const CMotionFile& Result() const { return result_; }
     const ProfileRows& Profile() const { return profile_; }
     /// Returns the file of the current profile; empty without one.
@@ -79,14 +79,14 @@ private:
     ConversionChoices choices_;
     NoticeListener notify_;
     std::string sourcePath_;
-    bool isScene_ = false; // whether the source is the scene or the motion below
+    bool isScene_ = false; // the source is the scene below, not the motion
     COrrinStream scene_;
     CMotionFile motion_;
     CFailureRecord sourceRecord_;
     CMotionFile result_;
     ProfileRows profile_;
     std::string profilePath_;
-    std::optional<CRetargeter> retargeter_; // new for each conversion, like the next one
+    std::optional<CRetargeter> retargeter_; // new for each conversion, like the next member
     std::optional<CConversion> conversion_;
 };
 

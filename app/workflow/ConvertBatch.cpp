@@ -1,4 +1,4 @@
-// Converts every file of a kind in one folder, without questions: sources to HTR files, or HTR files to
+// Converts all files of a kind in one folder without asking: sources to HTR files, or HTR files to
 // containers.
 
 #include "CBoneMapProfile.h"
@@ -76,7 +76,7 @@ EBatchStep CGaitConvertContent::ConvertFile(const std::string& path, const std::
     return saved ? EBatchStep::Done : EBatchStep::Ended;
 }
 
-// The profile is read from its file again for every source.
+// Reads the profile from its file again for every source.
 bool CGaitConvertContent::SelectProfileAgain()
 {
     const CCntComboExControl& list = *m_pkProfileCombo;

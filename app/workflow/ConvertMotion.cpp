@@ -27,7 +27,7 @@ int CGaitConvertContent::ConvertMotion()
     return 1;
 }
 
-// The stamp is taken first, so that a change during reading makes the next conversion read again.
+// The stamp is read first, so that a change during reading makes the next conversion read the file again.
 void CGaitConvertContent::LoadResult()
 {
     const std::optional<FileStamp> stamp = StampOf(BaseFile());
@@ -43,8 +43,8 @@ void CGaitConvertContent::ReloadResult()
     Notify(BaseFile(), m_kResultMotion.Record());
 }
 
-// Converts with the profile. If it cannot drive a conversion, reports why and returns false. The source is
-// looked up after the profile's message boxes, during which another one may be opened.
+// Converts with the profile. If that cannot drive a conversion, reports why and returns false. The source is
+// looked up after the profile's message boxes, because another source may be opened while they are shown.
 bool CGaitConvertContent::Retarget(bool heedsShift)
 {
     CRetargeter& retargeter = m_kRetargeter.emplace();

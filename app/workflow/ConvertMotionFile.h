@@ -8,14 +8,14 @@
 
 namespace gw {
 
-/// A conversion without questions. Paths are UTF-8.
+/// A conversion without user interaction. Paths are UTF-8.
 struct MotionFileJob
 {
-    std::string source;  ///< a motion file, or a container with keys
+    std::string source;  ///< a motion file, or a container with keyframes
     std::string profile; ///< path of a .prf file
-    /// ends in .Kinetra for a package; anything else yields an .htr. Replaced if it exists
+    /// ends in .Kinetra for a package; any other extension yields an .htr. An existing file is replaced
     std::string output;
-    std::string dataFolder;    ///< with base.htr and KsBone.bsm; empty for the program's own
+    std::string dataFolder;    ///< contains base.htr and KsBone.bsm; empty for the program's own folder
     ConversionChoices choices; ///< conversion options
 };
 
@@ -26,8 +26,8 @@ struct MotionFileResult
     std::vector<Notice> notices; ///< warnings, and at least one error if nothing was written
 };
 
-/// Opens, converts and saves one motion like the window and the shell, for programs that link the engine.
-/// Leaves no settings or folders behind.
+/// Opens, converts and saves one motion with the same result as the window and the shell program, for
+/// programs that link the engine. Leaves no settings or folders behind.
 MotionFileResult ConvertMotionFile(const MotionFileJob& job);
 
 } // namespace gw

@@ -12,7 +12,7 @@ struct KindWords
 {
     ECorrection kind;
     const char* code;
-    const char* one; // "1 joint ..."
+    const char* one; // singular: "1 joint ..."
     const char* many;
 };
 

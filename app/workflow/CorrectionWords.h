@@ -7,10 +7,10 @@ namespace gw {
 struct Corrections;
 enum class ECorrection : unsigned char;
 
-/// Returns the short fixed word for what an alignment corrects: "bone-frame".
+/// Returns the fixed short code of a kind of correction: "bone-frame".
 const char* CorrectionCode(ECorrection kind);
-/// Returns how many of each kind were corrected: "4 bones off their axes at rest, 2 rotated frames of slanted
-/// bones".
+/// Returns the number of corrections of each kind as text: "4 bones off their axes at rest, 2 rotated frames
+/// of slanted bones".
 std::string CorrectionWords(const Corrections& corrections);
 
 } // namespace gw

@@ -12,16 +12,16 @@ namespace {
 
 constexpr const char* kSurenessNames[] = {"sure", "likely", "doubtful"};
 
-// A code for programs, the sentence that people read, in pieces around the names of joints, and a phrase that
-// names none.
+// The texts of a doubt: a code for programs, a sentence in pieces around the names of joints, and a phrase
+// without names.
 struct DoubtText
 {
     EDoubt doubt;
     const char* code;
     const char* before;
-    const char* between; // between two joint names; null if only one is named
+    const char* between; // between two joint names; null if the sentence names only one
     const char* behind;
-    const char* phrase; // null for doubts that a drafted row cannot raise
+    const char* phrase; // null if a drafted row cannot raise this doubt
 };
 
 // Rows are function calls, because the formatter keeps their layout.
@@ -60,7 +60,7 @@ const DoubtText& TextOf(EDoubt doubt)
     return *std::ranges::find(kTexts, doubt, &DoubtText::doubt);
 }
 
-// If one bone is misrotated, many are: they share a sentence that names only a few.
+// If one bone is misrotated, usually many are: they share one sentence, which names only a few.
 std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
 {
     constexpr size_t kNamed = 4;

@@ -12,16 +12,16 @@ struct ProfileVerdict;
 enum class EDoubt : unsigned char;
 enum class ESureness : unsigned char;
 
-/// Returns the short fixed word for a doubt: "odd-length".
+/// Returns the fixed short code of a doubt: "odd-length".
 const char* DoubtCode(EDoubt doubt);
-/// Returns the doubt about a joint that was just named: "its bones are out of proportion". Null for
-/// OtherName, SpineCut and Turned.
+/// Returns the doubt as a phrase about a joint that was just named: "its bones are out of proportion". Null
+/// for OtherName, SpineCut and Turned.
 const char* DoubtPhrase(EDoubt doubt);
 /// Returns the doubt as a sentence that names the joints.
 std::string DoubtSentence(const ProfileDoubt& doubt);
 /// Returns "sure", "likely" or "doubtful".
 const char* SurenessName(ESureness sureness);
-/// Returns the doubts about a profile: one sentence per kind of flaw, with the joints that show it.
+/// Returns the doubts about a profile: one sentence per kind, with the joints concerned.
 std::vector<std::string> DoubtWords(const ProfileVerdict& verdict);
 /// Returns the doubts as warnings about a conversion with the profile.
 std::vector<Notice> DoubtWarnings(const std::string& source, const ProfileChoice& choice);

@@ -173,7 +173,7 @@ std::string InBrackets(std::string_view remedy)
     return remedy.empty() ? std::string() : " (" + std::string(remedy) + ')';
 }
 
-// Returns a number as people write it: "29.97", "30".
+// Returns a number without trailing zeros: "29.97", "30".
 std::string Short(double number)
 {
     char text[32];

@@ -10,14 +10,14 @@ namespace gw {
 
 struct MotionFacts;
 
-/// Returns the short fixed word for a finding.
+/// Returns the fixed short code of a finding.
 std::string_view FindingCode(const Finding& finding);
-/// Returns what can be done about it; empty if unknown.
+/// Returns what the user can do about it; empty if unknown.
 std::string_view FindingRemedy(const Finding& finding);
 /// Returns "error", "warning" or "note".
 std::string_view SeverityName(ESeverity severity);
-/// Returns the finding without the remedy: what is wrong, the name concerned unless it is the path, how
-/// often. Names are made safe to print.
+/// Returns the finding without the remedy: what is wrong, the name concerned unless that is the path, and how
+/// often it occurs. Names are made safe to print.
 std::string FindingWords(const std::string& path, const Finding& finding);
 /// Returns the finding as a notice, with the remedy.
 Notice MakeNotice(const std::string& path, const Finding& finding);

@@ -7,16 +7,16 @@
 
 namespace gw {
 
-/// Something that the fixed messages do not contain: why an operation failed, or what a user should know
+/// A message that is not one of the fixed ones: why an operation failed, or what the user should know
 /// although it succeeded.
 struct Notice
 {
     ESeverity severity = ESeverity::Error;
     std::string path;  ///< the file concerned, or empty
     size_t where = 0;  ///< line of a text, starting at 1, or byte of a container; 0 if unknown
-    std::string code;  ///< a short fixed word for programs: "blank-line"
+    std::string code;  ///< fixed short code for programs: "blank-line"
     std::string name;  ///< bone, keyword, class or text concerned, as written in the file
-    std::string words; ///< a sentence for people, with the remedy if there is one; safe to print
+    std::string words; ///< sentence for the user, with the remedy if there is one; safe to print
 
     bool IsWarning() const { return severity != ESeverity::Error; }
 };

@@ -15,7 +15,7 @@ namespace {
 
 constexpr std::string_view kPackageExtension = ".Kinetra";
 constexpr std::string_view kMotionExtension = ".htr";
-// The host plays packages at this rate; a result is stored in half-steps of it.
+// The host plays packages at this rate; results are stored in half-steps of it.
 constexpr float kHostRate = 60.0f;
 
 // Saves the result with rate / profileRate times as many frames.
@@ -29,7 +29,7 @@ bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
     return saved || record.Fail(failure.reason, failure.where, failure.name);
 }
 
-// The motion's text goes directly into the package, so an HTR file next to it is not touched.
+// The HTR text goes directly into the package, so an HTR file next to it is not touched.
 bool WritePackage(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
 {
     CPackageFile package;

@@ -10,9 +10,10 @@ namespace gw {
 
 class CMotionFile;
 
-/// Frames per second of a result saved by a user, relative to the profile's rate.
+/// Frame rate of a result saved by a user. The number of frames is multiplied by this rate / the profile's
+/// rate.
 inline constexpr float kSavedRate = 120.0f;
-/// Same for a batch run: at a profile rate of 30, the number of frames does not change.
+/// Same for a batch run: with a profile rate of 30, the number of frames does not change.
 inline constexpr float kBatchRate = 30.0f;
 
 /// What a batch run does with the files of a folder.
@@ -27,10 +28,10 @@ enum class EBatchStep : uint8_t
 {
     Done,
     Ended,     ///< the run ends with its summary
-    Abandoned, ///< the run ends immediately and leaves its title
+    Abandoned, ///< the run ends immediately, without restoring the title
 };
 
-/// Returns the extension of the files that a batch run reads, and that of its results.
+/// Return the extension of the files that a batch run reads, and of those it writes.
 std::string_view BatchSource(EBatchJob job);
 std::string_view BatchResult(EBatchJob job);
 

@@ -9,7 +9,7 @@
 
 namespace gw {
 
-/// The failures of one stream: the first error, and warnings.
+/// The failures of one stream: the first error, and the warnings.
 class CFailureRecord
 {
 public:
@@ -21,7 +21,7 @@ public:
             m_kFailure = {reason, where, std::move(name)};
         return false;
     }
-    /// Records a warning; only the first kWarningsPerReason of each reason are kept.
+    /// Records a warning. Only the first kWarningsPerReason of each reason are kept.
     void Warn(EFailure reason, size_t where = 0, std::string name = {});
     void Clear() { *this = {}; }
 

@@ -6,7 +6,8 @@
 
 namespace gw {
 
-/// What can be wrong with a file or a conversion. Only app/workflow/FindingWords has sentences for these.
+/// What can be wrong with a file or a conversion. The sentences for these are only in
+/// app/workflow/FindingWords.
 enum class EFailure : uint8_t
 {
     None,
@@ -15,7 +16,7 @@ enum class EFailure : uint8_t
     ReadError,      ///< the file system failed while reading
     Changed,        ///< another program truncated the file while it was being read
     WriteError,     ///< the file system failed while writing: full disk, no permission
-    Exists,         ///< the file must not be replaced; it may have appeared only meanwhile
+    Exists,         ///< an existing file must not be replaced; it may have appeared in the meantime
     OutOfMemory,    ///< not enough memory
     UnknownFormat,  ///< no reader for this extension
     BadHeader,      ///< the file does not begin as required
@@ -28,7 +29,7 @@ enum class EFailure : uint8_t
     BadCount,       ///< a count larger than the rest of the file can hold
     BadName,        ///< a name that is missing or too long
     BadBrace,       ///< unbalanced braces
-    MissingTokens,  ///< a line with too few values; `name` is the joint or key
+    MissingTokens,  ///< a line with too few values; `name` is the joint or the key
     TooFewRows,     ///< fewer rows than frames
     NoRoot,         ///< no root, or a joint before it
     UnknownSegment, ///< a section for a bone that is not in the hierarchy
@@ -50,7 +51,7 @@ enum class EFailure : uint8_t
     /// a linked picture that was not decoded, because the scene's pictures take too much memory
     SkippedPicture,
 
-    // Found by examining a motion file. From here on, readers and writers do not use the reasons.
+    // Found by examining a motion file. Readers and writers do not use the reasons from here on.
     LfsPointer,
     NotText,
     ByteOrderMark,
@@ -61,12 +62,12 @@ enum class EFailure : uint8_t
     BlankInName,
     SameName,
     ChannelCount,   ///< more channels listed than counted
-    IgnoredChannel, ///< an unknown channel, as UnknownChannel
+    IgnoredChannel, ///< an unknown channel, like UnknownChannel
     SecondRoot,
     EmptyLineBeforeFrames,
     EmptyLineInRows,
     DecimalComma,
-    RateForTime, ///< the frame time looks like a rate
+    RateForTime, ///< the frame time looks like a frame rate
     MissingRows,
     SurplusRows,
     NoFrames,
@@ -74,10 +75,10 @@ enum class EFailure : uint8_t
     LongRow, ///< a row with more values than there are channels
     NaN,
     NotNumber,        ///< a value that is not a number, or is followed by something else
-    DoubledBone,      ///< positions repeat the offset, as DoubledOffsets
-    DoubledHipOffset, ///< the hip's height is both in its offset and in its channels
+    DoubledBone,      ///< positions repeat the offset, like DoubledOffsets
+    DoubledHipOffset, ///< the hip's height is in its offset and also in its channels
     Spike,
-    StillRoot, ///< the joint below the root carries the motion
+    StillRoot, ///< the joint below the root carries the root's motion
     SidesSwapped,
     WrongRate, ///< the steps of the walk do not match the frame rate
     MixedChannels,
@@ -96,24 +97,24 @@ enum class EFailure : uint8_t
 enum class ESeverity : uint8_t
 {
     Error,   ///< refused, or read differently than intended
-    Warning, ///< read, but visible in a conversion
+    Warning, ///< read, but the effect is visible in a conversion
     Note,    ///< valid, but good to know
 };
 
-/// One thing that was found: why something failed, or what a user should know although it did not.
+/// One finding: why something failed, or what the user should know although it succeeded.
 struct Finding
 {
     EFailure reason = EFailure::None;
     size_t where = 0;      ///< line of a text, starting at 1, or byte of a container; 0 if unknown
     std::string name = {}; ///< bone, keyword, class or text concerned; may be empty
     ESeverity severity = ESeverity::Error;
-    bool mendable = false; ///< fixed in a repaired copy
+    bool mendable = false; ///< can be fixed in a repaired copy
     size_t more = 0;       ///< further findings like this one, which are only counted
 
     explicit operator bool() const { return reason != EFailure::None; }
 };
 
-/// Returns whether readers and writers use a reason, rather than an examination or a conversion.
+/// Returns whether a reason is used by readers and writers, not by an examination or a conversion.
 constexpr bool IsOfReader(EFailure reason)
 {
     return reason < EFailure::LfsPointer;

@@ -18,12 +18,12 @@ constexpr const char* kIndent = "    ";
 
 struct FaultWords
 {
-    const char* name; // for programs
+    const char* name; // identifier for programs
     const char* text;
     const char* unit;
 };
 
-// By EFrameFault.
+// Indexed by EFrameFault.
 constexpr FaultWords kFaults[] = {
     {"direction",  "mean error of the main bones", "deg"},
     {"trunk",      "trunk error",                  "deg"},

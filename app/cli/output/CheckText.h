@@ -7,13 +7,13 @@ namespace gw {
 class CJsonWriter;
 struct MeasuredConversion;
 
-/// Prints the measurements of a conversion as a compact block of lines on standard output.
+/// Prints the measurements of a conversion to standard output as a compact block of lines.
 void PrintCheck(const MeasuredConversion& measured, std::string_view title);
-/// Writes the same as members of an open JSON object, with all values of a comparison, the parts of the body
-/// and the worst frames.
+/// Writes the same as members of an open JSON object, including all values of a comparison, the parts of the
+/// body and the worst frames.
 void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured);
 /// Writes the key figures of a conversion as the member "figures": one number each, or null if the motion
-/// does not have the feature that it measures.
+/// does not have the feature that is measured.
 void WriteKeyFigures(CJsonWriter& json, const MeasuredConversion& measured);
 
 } // namespace gw

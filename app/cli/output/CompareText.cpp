@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-// The type of a record's figure.
+// A pointer to a record's member, by the type of its value.
 template <class Record>
 using Figure = std::variant<double Record::*, std::optional<double> Record::*, size_t Record::*,
                             int Record::*, bool Record::*, std::string Record::*, SlideMeasures Record::*>;
@@ -167,7 +167,7 @@ void WriteList(CJsonWriter& json, const char* name, const std::vector<Record>& r
     json.EndArray();
 }
 
-// The figure with its unit, or "none".
+// Returns the figure with its unit, or "none".
 std::string Optional(const std::optional<double>& value, int decimals = 3, const char* unit = "")
 {
     char text[48];

@@ -7,18 +7,18 @@ namespace gw {
 class CJsonWriter;
 struct ConversionMeasures;
 
-/// The layout of a list of records in JSON.
+/// How a list of records is laid out in JSON.
 enum class ERecordLayout : uint8_t
 {
-    Lines,   ///< one line per record, for people
-    OneLine, ///< everything on one line, for documents that are one line each
+    Lines,   ///< one line per record, for readability
+    OneLine, ///< everything on one line, for one-line documents
 };
 
-/// Prints the figures of a conversion as a table on standard output.
+/// Prints the figures of a conversion to standard output as a table.
 void PrintMeasures(const ConversionMeasures& measures);
 /// Prints the same without the table of bones, each line indented.
 void PrintSums(const ConversionMeasures& measures, const char* indent);
-/// Writes all figures as JSON on standard output; missing ones are null.
+/// Writes all figures to standard output as JSON; missing ones are null.
 void WriteMeasures(const ConversionMeasures& measures);
 /// Writes the same as members of an open JSON object.
 void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecordLayout layout);

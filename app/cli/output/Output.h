@@ -8,7 +8,7 @@
 
 namespace gw {
 
-/// Returns whether a command line does not have both --force and --skip-existing, which exclude each other;
+/// Returns whether a command line does not combine --force and --skip-existing, which exclude each other;
 /// prints an error if it does.
 bool IsDecidedOnExisting(const ShellOptions& options);
 /// Returns whether anything exists at a path, including a dangling link.
@@ -19,8 +19,8 @@ Notice UnreadableFolder(const std::string& path);
 bool CanListFolder(const ShellOptions& options, const std::string& path);
 /// Returns whether two paths refer to the same existing file.
 bool IsSameFile(const std::string& a, const std::string& b);
-/// Returns why a command must not write a file: it exists and --force is missing, or it is a folder. Without
-/// --force, saving to a writable path also fails if a file appears there first.
+/// Returns the reason why a command must not write a file: it exists and --force is missing, or it is a
+/// folder. No value if it may. Even then, saving without --force fails if the file appears in the meantime.
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path);
 /// Returns whether a command may write a file; prints an error if not.
 bool MayWrite(const ShellOptions& options, const std::string& path);

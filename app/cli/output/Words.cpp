@@ -12,7 +12,7 @@ namespace gw {
 
 void SayError(std::string_view words)
 {
-    // One write per line, so that lines of several programs on one terminal do not mix.
+    // One write per line, so that lines of several programs on one terminal do not interleave.
     const std::string line = "gaitwright: " + std::string(words) + '\n';
     std::fwrite(line.data(), 1, line.size(), stderr);
 }

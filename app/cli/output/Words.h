@@ -10,13 +10,13 @@ namespace gw {
 class CFailureRecord;
 struct ShellOptions;
 
-/// Prints a line to standard error after the program's name. Names from files must already be printable.
+/// Prints a line to standard error, after the program's name. Names from files must already be printable.
 void SayError(std::string_view words);
-/// The same for an invalid command line. Returns false, so that a check can return the result.
+/// Same for an invalid command line. Always returns false, so that a check can return the result.
 bool Refuse(std::string_view words);
-/// Same for information that is not a failure; silent with --quiet.
+/// Same for information that is not a failure; prints nothing with --quiet.
 void SayWord(const ShellOptions& options, std::string_view words);
-/// Prints a failure, or a warning unless --quiet.
+/// Prints a failure. A warning is printed only without --quiet.
 void SayNotice(const ShellOptions& options, const Notice& notice);
 /// Prints the failure recorded by a file's reader or writer.
 void SayFailure(const std::string& path, const Finding& failure);

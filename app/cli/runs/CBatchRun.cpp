@@ -1,4 +1,4 @@
-// Runs the desktop program's batch jobs in worker processes, with the outcome of a run in a single process.
+// Runs the desktop program's batch jobs in worker processes. The outcome is the same as in a single process.
 
 #include "CBatchRun.h"
 
@@ -49,8 +49,8 @@ EBatchStep CBatchRun::RunJob(const ConversionJob& job)
     return packaged ? EBatchStep::Done : EBatchStep::Abandoned;
 }
 
-// A file whose failure is reported counts as failed, but ends the run only if the desktop program's run would
-// end.
+// A file whose failure is reported counts as failed. It ends the run only if it would end the desktop
+// program's run.
 CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     const ConversionJob& job = AllJobs()[index];

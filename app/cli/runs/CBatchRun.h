@@ -11,8 +11,8 @@ namespace gw {
 class CShellConversion;
 class CShellNotices;
 
-/// The desktop program's batch run: one profile for all files, chosen before it begins, with its own
-/// messages. Every worker inherits the conversion in the state at its start.
+/// The desktop program's batch run: one profile for all files, chosen before the run starts, with its own
+/// messages. Every worker inherits the conversion as it is when the worker starts.
 class CBatchRun : public CFileRun
 {
 public:

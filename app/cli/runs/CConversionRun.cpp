@@ -39,7 +39,7 @@ void CConversionRun::TellUpToDate(size_t index)
     TellSkipped(Options(), AllJobs()[index], "the output is up to date");
 }
 
-// The requested profile, or all those that each source chooses from.
+// Adds the named profile, or all profiles that sources may choose from.
 bool CConversionRun::AddProfiles(CContentHash& key)
 {
     CShellNotices notices(Options());
@@ -55,7 +55,7 @@ bool CConversionRun::AddProfiles(CContentHash& key)
     return true;
 }
 
-// Moved out, because the next job may not be a conversion.
+// Moves the text out, because the next job may not be a conversion.
 std::string CConversionRun::Enclosure()
 {
     return std::exchange(m_kDrawn, {});

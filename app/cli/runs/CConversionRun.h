@@ -5,7 +5,7 @@
 
 namespace gw {
 
-/// Many independent conversions, as made by `convert`.
+/// Converts many independent files, for `convert`.
 class CConversionRun : public CFileRun
 {
 public:
@@ -24,7 +24,7 @@ protected:
 private:
     bool FinishPage();
 
-    std::string m_kDrawn; ///< the page's part of the last conversion, in a worker
+    std::string m_kDrawn; ///< in a worker: the page part of the last conversion
     CConversionPage m_kPage;
     size_t m_uiTaken = 0;
 };

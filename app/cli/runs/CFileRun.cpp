@@ -1,7 +1,7 @@
 // A run of many conversions. Workers convert; the program prints, writes reports and keeps the state for
-// --resume. Whether a source is up to date depends on a key: a hash of program version, options, profiles,
-// skeleton and source. The steps around a result are ordered so that a crash at any point loses no result and
-// claims none that does not exist; see CResumeState.h.
+// --resume. Whether a source is up to date is decided by a key: a hash of program version, options, profiles,
+// skeleton and source. The steps around saving a result are ordered so that a crash at any point neither
+// loses a result nor records one that does not exist; see CResumeState.h.
 
 #include "CFileRun.h"
 
@@ -45,7 +45,7 @@ size_t WorkerCount(const ShellOptions& options, size_t jobCount)
     return std::min(options.jobs ? static_cast<size_t>(*options.jobs) : cores, jobCount);
 }
 
-// The members of a record that the run itself knows; the rest is the same in every run.
+// Returns the members of a record that differ between runs; the rest is the same in every run.
 std::string RecordHead(const ConversionJob& job)
 {
     CTextFile text;
@@ -58,7 +58,7 @@ std::string RecordHead(const ConversionJob& job)
     return text.Text() + ',';
 }
 
-// Returns a writer's record without its end, with the time that the job took.
+// Returns a writer's record, still open at the end, with the job's duration added.
 std::string Timed(std::string record, double seconds)
 {
     record.resize(std::min(record.size(), record.rfind('}')));
@@ -115,7 +115,7 @@ bool CFileRun::Open()
 {
     if (options_.resume && !OpenState())
         return false;
-    if (!options_.dryRun && !OpenReport()) // last, because it empties the existing report
+    if (!options_.dryRun && !OpenReport()) // last, because it truncates an existing report
         return false;
     if (!options_.dryRun)
         SweepLeftovers();
@@ -147,7 +147,7 @@ std::optional<Notice> CFileRun::WhyNotReport() const
         return MakeNotice(path, "in-use",
                           "the run reads or writes this file; choose another file for the report");
     if (options_.resume && CReportFile::IsReport(path))
-        return std::nullopt; // a further message would repeat the first one
+        return std::nullopt; // another message would repeat the first one
     return WhyNotWrite(options_, path);
 }
 
@@ -169,7 +169,7 @@ bool CFileRun::OpenState()
     return false;
 }
 
-// Deletes files that killed runs could not delete.
+// Deletes files left over by killed runs.
 void CFileRun::SweepLeftovers() const
 {
     std::set<std::string> folders;
@@ -195,7 +195,7 @@ EExit CFileRun::Finish(bool ran, int requests)
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
 }
 
-// Before anything reports the run as done. A run of one file has already synced it.
+// Called before anything reports the run as done. In a run of one file, the result has already been synced.
 bool CFileRun::SyncResults()
 {
     if (options_.resume && m_kResume.HasUnsynced())
@@ -234,7 +234,7 @@ CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t i
     FileEnd end{.endsRun = !options.keepGoing};
     try
     {
-        // A folder in the list could not be read, and is reported in place of its files.
+        // A folder in the list could not be read; it is reported in place of its files.
         if (FolderExists(m_kJobs[index].source))
             TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
         else

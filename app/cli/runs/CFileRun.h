@@ -21,12 +21,12 @@ struct Notice;
 /// Where a run keeps its state for the next run.
 struct RunState
 {
-    std::string folder;       ///< with trailing separator, or empty for the current folder
-    std::string name = "run"; ///< distinguishes several runs into one folder
+    std::string folder;       ///< with a trailing separator, or empty for the current folder
+    std::string name = "run"; ///< distinguishes several runs in one folder
 };
 
-/// Converts many files in worker processes. Messages and records appear in source order, whatever finishes
-/// first. Derived classes define how a file is converted, and when a failure ends the run.
+/// Converts many files in worker processes. Messages and records appear in source order, no matter which file
+/// finishes first. Derived classes define how a file is converted and when a failure ends the run.
 class CFileRun : public CJobHandler
 {
 public:
@@ -36,7 +36,7 @@ public:
     CFileRun(const ShellOptions& options, Jobs jobs, RunState state);
     ~CFileRun() override;
 
-    /// Converts everything. Prints why it cannot start, or what is left.
+    /// Converts everything. If it cannot start or finish, prints the reason or the number of files left.
     EExit RunAll();
     const RunTally& Tally() const { return m_kTally; }
 
@@ -47,12 +47,12 @@ public:
     void Tick(size_t ended) final;
 
 protected:
-    /// How a conversion ended, in a worker; sent to the program as a number.
+    /// The outcome of a conversion in a worker; sent to the program as a number.
     struct FileEnd
     {
         EConversion outcome = EConversion::Failed;
-        bool endsRun = false;  ///< by the rules of the command
-        bool abandons = false; ///< ends the run without a summary
+        bool endsRun = false;  ///< the command's rules end the run here
+        bool abandons = false; ///< the run ends without a summary
     };
 
     /// Converts one source. Called in a worker.
@@ -63,9 +63,10 @@ protected:
     virtual void TellUpToDate(size_t index) = 0;
     /// Returns data for the program in addition to the record. Called in a worker after Convert.
     virtual std::string Enclosure() { return {}; }
-    /// Handles the record of a source and the data enclosed with it, in source order.
+    /// Handles a source's record and the data enclosed with it, in source order.
     virtual void TakeRecord(size_t, EConversion, std::string_view, std::string_view) {}
-    /// Adds the possible profiles to the key of all results. If there are none, prints why and returns false.
+    /// Adds all profiles that may be used to the key of every result. If there are none, prints why and
+    /// returns false.
     virtual bool AddProfiles(CContentHash& key) = 0;
     /// Prints the summary. Returns whether everything succeeded.
     virtual bool TellEnd() = 0;
@@ -95,9 +96,9 @@ private:
     Jobs m_kJobs;
     RunState m_kState;
     CResumeState m_kResume;
-    std::string m_kCommonKey;     ///< for everything but the source
-    std::string m_kReadyDigits;   ///< hash of the job's result, in a worker
-    std::string m_kReadyModified; ///< and its modification time
+    std::string m_kCommonKey;     ///< covers everything except the source
+    std::string m_kReadyDigits;   ///< in a worker: hash of the job's result
+    std::string m_kReadyModified; ///< its modification time
     CReportFile m_kReport;
     CDeferredSync m_kSync;
     CProgressBar m_kBar;

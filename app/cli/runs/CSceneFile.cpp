@@ -1,5 +1,5 @@
-// Reads any supported file and offers it as roots, nodes and a clock. The extension is tried first; a file
-// with an unknown one is tested for a container header.
+// Reads any supported file and presents it as roots, nodes and a clock. The extension decides; if it is
+// unknown, the file is tested for a container header.
 
 #include "CSceneFile.h"
 
@@ -32,7 +32,7 @@ bool CSceneFile::Load(const std::string& path)
     if (!m_bContainer && (m_kMotion.Load(path) || Failure().reason != EFailure::UnknownFormat))
         return !Failure();
     const bool isContainer = m_kScene.LoadFile(path, false);
-    // A file that cannot be opened is not of an unknown kind.
+    // A file that cannot be opened should not be reported as an unknown format.
     m_bContainer = m_bContainer || isContainer || IsUnreachable(m_kScene.Record().Failure().reason);
     return isContainer;
 }
@@ -56,7 +56,7 @@ std::vector<CObject*> CSceneFile::Roots() const
     return roots;
 }
 
-// Not with FindObjects, which would list a shared node once per place.
+// FindObjects is not used here, because it lists a shared node once per position.
 std::vector<FoundNode> CSceneFile::Nodes() const
 {
     std::vector<FoundNode> found;
@@ -84,7 +84,7 @@ std::vector<FoundNode> CSceneFile::Nodes() const
     return found;
 }
 
-// The save list contains every object once, in FindObject's order.
+// The save list contains every object once, in the order of FindObject.
 const CKeyframeControl* CSceneFile::FirstTrack()
 {
     const std::vector<CObject*> objects = Objects();
@@ -111,7 +111,7 @@ float CSceneFile::TimeOf(int64_t frame)
 }
 
 // A root can be below other roots. Their bounds are updated once at the end instead of after every root: in a
-// chain of thousands of roots, updating all ancestors each time would take forever.
+// chain of thousands of roots, updating all ancestors each time would be far too slow.
 void CSceneFile::Update(float time)
 {
     std::unordered_set<CSpatial*> above;

@@ -12,7 +12,7 @@ namespace gw {
 
 class CKeyframeControl;
 
-/// A node found by a walk, and its parent or null.
+/// A node found by a tree walk, and its parent, or null for a root.
 struct FoundNode
 {
     CNode* node;
@@ -20,16 +20,17 @@ struct FoundNode
     size_t depth;
 };
 
-/// Any file that the program can read, motion or container, as one thing: roots, nodes and a clock.
+/// Any supported file, motion or container, as roots, nodes and a clock.
 class CSceneFile
 {
 public:
-    /// Reads a file by its extension, otherwise by its first bytes. Returns false, with the reason in
-    /// Failure(), if nothing in it is usable. Returns true for a damaged container, read as far as possible:
-    /// see IsDamaged.
+    /// Reads a file by its extension, or by its first bytes if the extension is unknown. Returns false, with
+    /// the reason in Failure(), if nothing in it is usable. Returns true for a damaged container, which is
+    /// read as far as possible: see IsDamaged.
     bool Load(const std::string& path);
 
-    /// Same for commands that need the whole file. Prints what is wrong.
+    /// Same for commands that need the whole file. Returns false, after printing what is wrong, for a damaged
+    /// file too.
     bool LoadWhole(const std::string& path);
 
     bool IsContainer() const { return m_bContainer; }
@@ -40,9 +41,9 @@ public:
     const CMotionFile& Motion() const { return m_kMotion; }
     COrrinStream& Scene() { return m_kScene; }
 
-    /// Returns all nodes below the roots, depth first, each at its first place.
+    /// Returns all nodes below the roots, depth first, each once at its first position.
     std::vector<FoundNode> Nodes() const;
-    /// Returns the first track, whose clock is used for the whole file, or null.
+    /// Returns the first track, whose clock applies to the whole file, or null.
     const CKeyframeControl* FirstTrack();
     /// Returns the time at which the first track reaches a frame.
     float TimeOf(int64_t frame);

@@ -1,6 +1,6 @@
 // Chooses the bone map of a conversion. A named one is used as it is. Without a name, a stock map is used if
-// all its rows match the source, as the program has always done; otherwise the best of all installed maps,
-// unless its joints contradict it: then the user must name it.
+// all its rows match the source, for compatibility. Otherwise the best installed map is used, unless the
+// joint positions contradict it: then the user must name it.
 
 #include "CShellConversion.h"
 
@@ -25,7 +25,7 @@ namespace gw {
 
 namespace {
 
-// The original stock profiles, in the order in which they are tried.
+// The original stock profiles, in the order they are tried.
 constexpr const char* kLongKnown[] = {"PoserBVH.prf", "MaxBVH.prf"};
 
 std::vector<std::string> NamesOf(const std::vector<InstalledProfile>& profiles)
@@ -151,7 +151,7 @@ std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
         if (profile.text)
             profiles.push_back({profile.path, *profile.text});
     }
-    // If nothing fits at all, report a profile that animators know.
+    // If nothing fits at all, prefer to report a profile that animators know.
     const auto rank =
         [known = std::array{DataFile(kLongKnown[0]), DataFile(kLongKnown[1])}](const LoadedProfile& profile) {
             return std::ranges::find(known, profile.path) - known.begin();
@@ -177,7 +177,7 @@ bool CShellConversion::SelectFitting()
     return false;
 }
 
-// A stock profile has always been used if its rows fit, so doubts about it are only warnings.
+// For compatibility, a stock profile is used whenever its rows fit, so doubts about it are only warnings.
 void CShellConversion::WarnOfStockPick() const
 {
     const std::string path[] = {ProfilePath()};

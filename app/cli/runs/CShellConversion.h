@@ -21,12 +21,13 @@ struct InstalledProfile
 {
     std::string name;
     std::string path;
-    bool stock = false;                   ///< installed with the program, not the user's own
-    std::optional<std::string_view> text; ///< no value if it cannot be read; valid as long as the conversion
+    bool stock = false; ///< installed with the program, not the user's own
+    std::optional<std::string_view>
+        text; ///< no value if it cannot be read; valid as long as the conversion exists
 };
 
-/// The conversion as used by the shell, including the choice of the profile. The installed profiles are
-/// listed when they are first needed and then kept.
+/// The conversion of the shell program, including the choice of a profile. The installed profiles are listed
+/// when first needed, and the list is kept.
 class CShellConversion : public CFileConversion
 {
 public:
@@ -36,21 +37,21 @@ public:
     /// Opens a source and loads the target. If no profile was named, selects a stock profile that fits.
     /// Returns false, after reporting the reason, if anything failed.
     bool Open(const std::string& path);
-    /// Returns the installed profiles, each name once, with its file.
+    /// Returns the installed profiles with their files, each name once.
     const std::vector<InstalledProfile>& InstalledProfiles();
-    /// Returns the file of a profile given by its path ending in .prf, by its display name, or by any other
-    /// path. Empty, after printing why, if none can be read.
+    /// Returns the file of a profile, given by a path ending in .prf, by its display name, or by any other
+    /// path. Returns an empty path, after printing the reason, if none can be read.
     std::string ResolveProfile(const std::string& nameOrFile);
-    /// Selects the profile named in the options, or the best choice. Returns false, after reporting the
-    /// reason, if it cannot be read, if no profile fits the source, and if the best one is doubtful.
+    /// Selects the profile named in the options, or the best one. Returns false, after reporting the reason,
+    /// if the profile cannot be read, if none fits the source, or if the best one is doubtful.
     bool SelectProfile();
-    /// Returns the installed profiles, best first for the open source: the stock profile that was selected at
-    /// open, then by ChooseProfile.
+    /// Returns the installed profiles, best first, for the open source: the stock profile selected at open,
+    /// then the others in ChooseProfile's order.
     std::vector<ProfileChoice> Choices(EJudged judged = EJudged::All);
-    /// Returns the choice; nothing for a named profile or an original stock profile.
+    /// Returns the chosen profile; no value for a named profile or an original stock profile.
     const std::optional<ProfileChoice>& Chosen() const { return chosen_; }
     bool IsAdapted() const { return chosen_ && chosen_->adapted; }
-    /// Returns how well the closest profile fits, if none did.
+    /// Returns how well the closest profile fits if none fits fully.
     const std::optional<CProfileFit>& Nearest() const { return nearest_; }
     /// Measures how a profile fits the open source. Returns false if its file cannot be read.
     bool Measure(const std::string& profilePath, CProfileFit& fit) const;

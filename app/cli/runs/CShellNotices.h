@@ -9,8 +9,8 @@ namespace gw {
 
 struct ShellOptions;
 
-/// The notices of a conversion: printed to standard error immediately and kept, except for the program's
-/// fixed messages, which other programs do not need.
+/// The notices of a conversion. They are printed to standard error immediately, and all are kept except the
+/// program's fixed messages, which other programs do not need.
 class CShellNotices
 {
 public:
@@ -25,7 +25,7 @@ public:
         notices_.push_back(notice);
         hasFailed_ = hasFailed_ || !notice.IsWarning();
     }
-    /// Returns whether there was a notice that is not a warning.
+    /// Returns whether any notice is not a warning.
     bool HasFailed() const { return hasFailed_; }
     /// Returns all notices, in order.
     const std::vector<Notice>& All() const { return notices_; }

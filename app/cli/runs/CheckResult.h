@@ -10,20 +10,21 @@ class CFileConversion;
 struct ConversionJob;
 struct ShellOptions;
 
-/// The source of a conversion that is made, as it was read; it moves by the track by which it was converted.
+/// Returns the source of a finished conversion as it was read; it moves by the track that was used to convert
+/// it.
 MotionClip SourceClipOf(const CFileConversion& conversion);
 
-/// The source and the result of a conversion that is made, as clips of trees that live with it; named after
-/// the job. The result is saved already: its tracks become what its file has of them.
+/// Returns the source and result of a finished conversion as clips, named after the job. Their trees belong
+/// to the conversion. The result must already be saved: its tracks are changed to what its file contains.
 ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job);
 
-/// Compares source and result by the profile that the conversion used. Returns nothing if the profile can no
-/// longer be read or the motion has no frames.
+/// Compares source and result with the profile that the conversion used. Returns no value if the profile can
+/// no longer be read or the motion has no frames.
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,
                                                 const std::string& profilePath);
 
-/// Converts the job's source once more by the plain rules, without a word, and measures what comes of it.
-/// Nothing where that fails, and where the options ask for the plain rules as it is.
+/// Converts the job's source again with the default conversion, without messages, and measures the result.
+/// Returns no value if that fails, or if the options already select the default conversion.
 std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options, const ConversionJob& job,
                                                     const std::string& profilePath);
 

@@ -5,8 +5,9 @@
 namespace gw {
 
 /// Lists the conversions of a command line with many files: all files that the open dialog would show, each
-/// to a Kinetra file below the output folder, or next to its source without one. Prints an error and returns
-/// its code if they cannot be listed, two would write the same file, or there are none.
+/// converted to a Kinetra file below the output folder, or next to its source if there is none. If they
+/// cannot be listed, if two would write the same file, or if there are none, prints an error and returns its
+/// code.
 EExit ListConversions(const ShellOptions& options, CFileRun::Jobs& jobs);
 
 } // namespace gw

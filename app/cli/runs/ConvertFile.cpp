@@ -1,6 +1,5 @@
-// One conversion of the shell program: open, choose a profile, convert, save, measure. Each step continues
-// only if the previous one succeeded, and the outcome becomes the result line, the JSON record and a part of
-// the page.
+// One conversion of the shell program: open, choose a profile, convert, save, measure. Each step runs only if
+// the previous one succeeded. The outcome becomes the result line, the JSON record and a part of the page.
 
 #include "ConvertFile.h"
 
@@ -32,7 +31,7 @@ namespace {
 
 constexpr const char* kOutcomeNames[] = {"converted", "planned", "skipped", "failed"};
 
-/// The reported facts about a conversion.
+/// The facts that are reported about a conversion.
 struct Account
 {
     EConversion outcome = EConversion::Failed;
@@ -41,14 +40,14 @@ struct Account
     int frames = 0;
     std::optional<CProfileFit> misfit;
     std::optional<MeasuredConversion> check;
-    std::optional<MeasuredConversion> plainCheck; // of the same motion without options
-    std::optional<ProfileChoice> chosen; ///< unless the profile was named or is an original stock one
+    std::optional<MeasuredConversion> plainCheck; // for the same motion without options
+    std::optional<ProfileChoice> chosen; ///< no value if the profile was named or is an original stock one
     const char* whySkipped = "the output exists";
 };
 
-// Leaves a motion's memory to the system, which frees a whole process faster: deleting object by object takes
-// three percent of a small conversion. Only for the last work of a process, and not for scenes, whose
-// pictures can have temporary files.
+// Keeps a motion reachable until exit instead of freeing it: the system frees a whole process faster, and
+// deleting object by object takes three percent of a small conversion. Only for the last work of a process,
+// and not for scenes, whose pictures can have temporary files.
 void KeepUntilExit(CNode* root)
 {
     static std::array<CNode*, 2> keptRoots{}; // reachable memory is not a leak
@@ -59,7 +58,7 @@ void KeepUntilExit(CNode* root)
     *free = root;
 }
 
-// One job, step by step. Each step returns whether the next one may follow.
+// Runs one job in steps. Each step returns whether the next one may run.
 class CJobSteps
 {
 public:
@@ -104,7 +103,7 @@ public:
 private:
     bool SelectProfile();
     bool Convert();
-    // A later run with --resume may have a report.
+    // A later run with --resume may write a report, so measure for it.
     bool IsMeasured() const
     {
         return options_.check || m_pkPart || !options_.report.empty() || options_.resume;
@@ -116,7 +115,7 @@ private:
     const ConversionJob& job_;
     CShellNotices& notices_;
     Account& account_;
-    CPagePart* m_pkPart; // null if no page is requested
+    CPagePart* m_pkPart; // null if no page was requested
     CShellConversion m_kConversion;
 };
 
@@ -154,7 +153,7 @@ bool CJobSteps::Convert()
     return m_kConversion.HasFrames();
 }
 
-// Called after saving, because measuring poses both trees.
+// Must run after saving, because measuring poses both trees.
 void CJobSteps::Check()
 {
     ConvertedMotion motion = MotionOf(m_kConversion, job_);
@@ -210,7 +209,7 @@ void WriteChecks(CJsonWriter& json, const Account& account)
     json.EndObject();
 }
 
-// The confidence follows the name of a profile that was chosen automatically.
+// Adds the confidence after the name of a profile that was chosen automatically.
 std::string ProfileWords(const Account& account)
 {
     const std::string name = Quoted(account.profile);

@@ -22,8 +22,8 @@ struct ConversionJob
 enum class EConversion : uint8_t
 {
     Converted,
-    Planned, ///< with --dry-run: would be converted
-    Skipped, ///< the output exists, with --skip-existing
+    Planned, ///< with --dry-run: it would be converted
+    Skipped, ///< with --skip-existing: the output exists
     Failed,
 };
 
@@ -34,20 +34,20 @@ const char* OutcomeName(EConversion outcome);
 enum class EProcess : uint8_t
 {
     GoesOn,
-    Ends, ///< its motions need not be freed
+    Ends, ///< ends, so its motions need not be freed
 };
 
-/// Runs one conversion as the desktop program does: open, choose a profile, convert, save. Prints the result
-/// to standard output and everything else to standard error. Keeps nothing for the next source. `record`,
-/// unless null, receives the --json output and the key figures; a page part receives the conversion's
-/// pictures and figures.
+/// Runs one conversion like the desktop program: open, choose a profile, convert, save. Prints the result to
+/// standard output and everything else to standard error. Keeps no state for the next source. `record`,
+/// unless null, receives the --json output and the key figures; `part`, unless null, receives the
+/// conversion's pictures and figures.
 EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
                         CPagePart* part, EProcess process = EProcess::GoesOn);
 
-/// Reports in the same way a conversion that failed for a reason it could not report itself.
+/// Reports, in the same format, a conversion that failed for a reason it could not report itself.
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
                 std::FILE* record);
-/// Reports in the same way a conversion that is skipped.
+/// Reports, in the same format, a skipped conversion.
 void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why);
 
 } // namespace gw

@@ -10,7 +10,7 @@ namespace gw {
 
 namespace {
 
-// Most records end like this, as WriteNotices writes them, and need not be parsed.
+// Most records end with this text, exactly as WriteNotices writes it, and need not be parsed.
 constexpr std::string_view kNoNotices = R"("failures":[],"warnings":[])";
 
 struct Member

@@ -15,7 +15,7 @@ namespace {
 
 using Json = nlohmann::json; // only for single values, never for trees
 
-// The types of the record's members. A picture's size is never part of a conversion.
+// The types of the record's members. The size of a picture is never part of a conversion.
 template <class T>
 concept Plain = std::same_as<T, bool> || std::same_as<T, std::string> || std::same_as<T, float> ||
     std::same_as<T, int64_t>;

@@ -22,7 +22,8 @@ bool SayNoTemporary(const std::string& folder)
     return false;
 }
 
-// Streams read files, so the bytes inside a package are written to a temporary one. Prints why it fails.
+// Streams read only files, so the bytes inside a package are written to a temporary file first. Returns
+// false, after printing the reason, if that fails.
 bool LoadBytes(const std::string& path, std::span<const std::byte> bytes, const char* extension,
                CMotionFile& motion)
 {

@@ -8,7 +8,7 @@ namespace gw {
 
 namespace {
 
-// These reasons need other sentences for plans than for motion files.
+// For these reasons, the sentences about plans differ from those about motion files.
 std::string PlanWords(const std::string& path, const Finding& failure)
 {
     const std::string place = path + ':' + std::to_string(failure.where);

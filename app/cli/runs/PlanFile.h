@@ -4,7 +4,8 @@
 
 namespace gw {
 
-/// Reads a plan written by this version of the program. Prints why it fails.
+/// Reads a plan written by this version of the program. Returns false, after printing the reason, if that
+/// fails.
 bool LoadPlan(const std::string& path, CRunPlan& plan);
 
 /// Returns the default report file of a shard, next to the plan.

@@ -16,10 +16,10 @@ namespace gw {
 
 namespace {
 
-// Seven numbers of at least eight characters ("0.000000"), each after a separator, and a line end.
+// Seven numbers of at least eight characters ("0.000000"), each with a separator, and a line end.
 constexpr double kLeastRowBytes = 7 * 9 + 1;
 
-// Returns the total length of the row numbers from 1 to a count.
+// Returns the total number of digits of all row numbers from 1 to a count.
 double NumberBytes(double rowCount)
 {
     double bytes = 0.0;

@@ -11,7 +11,7 @@ namespace gw {
 
 namespace {
 
-constexpr int64_t kWorkerLimit = 1024; // far above the cores of any machine, far below the system's limit
+constexpr int64_t kWorkerLimit = 1024; // far more than any machine has cores, far below the system's limit
 
 } // namespace
 

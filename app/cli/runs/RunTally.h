@@ -8,11 +8,11 @@
 
 namespace gw {
 
-/// The number of sources by outcome.
+/// The number of sources for each outcome.
 struct RunTally
 {
     std::array<size_t, 4> ended{}; ///< indexed by EConversion
-    size_t left = 0;               ///< not processed by the run
+    size_t left = 0;               ///< not reached by the run
 
     size_t& operator[](EConversion outcome) { return ended[static_cast<size_t>(outcome)]; }
     size_t operator[](EConversion outcome) const { return ended[static_cast<size_t>(outcome)]; }

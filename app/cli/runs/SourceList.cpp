@@ -16,7 +16,7 @@ namespace gw {
 
 namespace {
 
-// Parts such as ".." have no equivalent below an output folder.
+// Components such as ".." have no equivalent below an output folder.
 std::vector<std::string> Steps(const std::string& path)
 {
     std::vector<std::string> steps;
@@ -67,7 +67,7 @@ bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
     return true;
 }
 
-// A folder that cannot be read is listed in place of its sources: converting it fails with a message.
+// A folder that cannot be read is listed in place of its sources; converting it then fails with a message.
 void AddFolder(const std::string& folder, const std::string& below, const ShellOptions& options,
                std::span<const std::string_view> extensions, std::vector<RunSource>& sources)
 {

@@ -9,16 +9,16 @@
 
 namespace gw {
 
-/// A source and its relative position, which its result keeps below the output folder.
+/// A source and its relative path, which its result keeps below the output folder.
 struct RunSource
 {
     std::string path;
-    std::string below; ///< "run/walk.bvh"; for a file that was named directly, its name
+    std::string below; ///< such as "run/walk.bvh"; only the name for a file named directly
 };
 
 /// Lists the sources named on a command line: files as they are, folders with all sources below them. The
-/// same for the lines of --files-from, whose positions are relative to their common folder. If the list
-/// cannot be read, prints why and returns false.
+/// lines of --files-from are treated the same; their paths are relative to their common folder. Returns
+/// false, after printing the reason, if the list cannot be read.
 bool ListSources(const ShellOptions& options, std::span<const std::string_view> extensions,
                  std::vector<RunSource>& sources);
 

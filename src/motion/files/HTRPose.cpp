@@ -14,10 +14,10 @@ namespace gw {
 namespace {
 
 constexpr const char* kOrder = "ZYX";
-// Farther from a quarter turn the rule's angles are good to 0.001 degrees: in 32 bits, the arc sine and the
-// quotients are off by 6e-8 / cos.
+// Angle about Y in degrees. Below it, the usual angles are accurate to 0.001 degrees: in 32 bits, the arc
+// sine and the quotients are off by 6e-8 / cos.
 constexpr float kNearQuarterTurn = 89.5f;
-constexpr float kMostOff = 1.7e-5f; // 0.001 degrees in radians, which a matrix is off by in its elements
+constexpr float kMostOff = 1.7e-5f; // 0.001 degrees in radians: tolerance for each element of a matrix
 
 bool IsNearQuarterTurn(const Vec3& degrees)
 {
@@ -34,7 +34,7 @@ bool IsSameTurn(const Mat3& a, const Mat3& b)
     return true;
 }
 
-// The angles that read back as a turn, where those of the rule do not.
+// Returns the usual angles if they read back as the same rotation, otherwise angles that do.
 Vec3 ReadBackDegrees(const Mat4& local, const Vec3& degrees, const HTRBase& base)
 {
     const Mat3 turn = NormalizedRows(local);
@@ -57,7 +57,7 @@ Vec3 Rounded(const Vec3& v)
     return {Rounded(v.x), Rounded(v.y), Rounded(v.z)};
 }
 
-// What a reader makes of the angles in a row's text.
+// Returns the rotation that a reader gets from the angles in a row's text.
 Quat ReadBack(const Mat3& turn, const HTRBase& base, EQuarterTurns quarterTurns)
 {
     const HTRRow row = RowOf(Mat4Compose(turn, kVec3Zero), false, base, quarterTurns);
@@ -66,7 +66,7 @@ Quat ReadBack(const Mat3& turn, const HTRBase& base, EQuarterTurns quarterTurns)
 
 void TakeWrittenKeys(CKeyframeControl& track, bool isRoot, const HTRBase& base, EQuarterTurns quarterTurns)
 {
-    constexpr float kNearOne = 0.99996f; // the sine of kNearQuarterTurn
+    constexpr float kNearOne = 0.99996f; // sine of kNearQuarterTurn
     for (Quat& key : track.m_kRotationKeys)
     {
         const Mat3 turn = QuatToMat3(key);

@@ -16,20 +16,20 @@ struct HTRBase
     Vec3 degrees = kVec3Zero;
 };
 
-/// The angles of a pose at a quarter turn about Y, where those about X and Z run into each other.
+/// How angles are written at a quarter turn about Y, where the angles about X and Z are not unique.
 enum class EQuarterTurns : uint8_t
 {
-    Flipped, ///< by the rule for all poses, which a reader takes for the opposite turn
-    ReadBack ///< angles that a reader turns into the pose again, to 0.001 degrees
+    Flipped, ///< same formula as for all other poses; reads back as the opposite quarter turn
+    ReadBack ///< angles that read back as the same pose, within 0.001 degrees
 };
 
-/// The row of a local matrix. Only the root carries its translation.
+/// Returns the row for a local matrix. Only the root's row includes its translation.
 HTRRow RowOf(const Mat4& local, bool isRoot, const HTRBase& base, EQuarterTurns quarterTurns);
 
-/// Changes the motion of a result to what its file has of it: bones rest as the base pose and keep its
-/// offsets, and keys near a quarter turn about Y become what a reader makes of their text. All others keep
-/// their turns, as the text's six decimals are finer than a key's 32 bits. To be called when the result is
-/// saved.
+/// Changes the motion of a result to what its file contains: the rest pose of each bone is the base pose,
+/// bones keep their base offsets, and keys near a quarter turn about Y become what a reader gets from their
+/// text. All other rotations are unchanged, because the six decimals of the text are finer than a key's 32
+/// bits. Call it after the result is saved.
 void TakeWrittenPoses(const CMotionFile& result);
 
 } // namespace gw

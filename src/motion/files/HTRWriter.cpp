@@ -49,8 +49,8 @@ void AddSegments(const CNode& node, std::string_view parentName, TKHTRFile& file
     }
 }
 
-// For each segment, the index of the animated node with its name, or kNoNode. Equal names are matched in
-// order.
+// Returns, for each segment, the index of the animated node with its name, or kNoNode. Nodes with the same
+// name are matched in order.
 std::vector<size_t> NodesOfSegments(const TKHTRFile& file, const std::vector<CNode*>& nodes)
 {
     std::unordered_map<std::string_view, std::vector<size_t>> nodesOfName;
@@ -75,7 +75,7 @@ std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
     return times;
 }
 
-/// The rows of all segments, computed while writing or, if nodes depend on each other, in advance.
+/// The rows of all segments, computed during writing or, if nodes depend on each other, in advance.
 class CRows
 {
 public:
@@ -117,7 +117,7 @@ public:
 private:
     static int NumberOf(size_t frame) { return static_cast<int>(frame) + 1; }
 
-    // The usual case. Nearly all of the time of a save is spent here.
+    // The usual case. Saving spends nearly all of its time here.
     void WriteSampled(CLineWriter& out, size_t segment, const CKeyframeControl& track) const
     {
         const bool isRoot = !m_kSampler.Nodes()[m_kNodeOfSegment[segment]]->GetParent();
@@ -223,7 +223,7 @@ void WriteRows(CLineWriter& out, const TKHTRFile& file, CRows& rows)
     }
 }
 
-// What writes the whole text, as long as the arguments live.
+// Returns a function that writes the whole text. It is valid as long as the arguments are.
 std::function<bool(CLineWriter&)> TextOf(const TKHTRFile& file, CRows& rows, CFailureRecord& record)
 {
     return [&](CLineWriter& out) {
@@ -240,7 +240,7 @@ std::function<bool(CLineWriter&)> TextOf(const TKHTRFile& file, CRows& rows, CFa
 
 bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
 {
-    // Rounded once, from the exact product to 32 bits.
+    // Rounded once: the exact product to 32 bits.
     const auto frames =
         static_cast<float>(static_cast<double>(GetKeyCount()) * static_cast<double>(frameScale));
     const double rate = 1.0 / static_cast<double>(GetFrequency());
