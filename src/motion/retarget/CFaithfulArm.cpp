@@ -36,8 +36,9 @@ std::optional<CFaithfulArm> CFaithfulArm::Plan(const CRetargeter& retargeter, co
     CNode* const hand = FindNode(&targetRoot, side.hand);
     CNode* const forearm = FindNode(&targetRoot, side.forearm);
     CNode* const upperArm = FindNode(&targetRoot, side.upperArm);
-    if (!hand || hand->GetParentNode() != forearm || forearm->GetParentNode() != upperArm || !upperArm ||
-        !upperArm->GetParentNode() || !retargeter.SourceOf(forearm) || !retargeter.SourceOf(upperArm))
+    if (!hand || !forearm || !upperArm || hand->GetParentNode() != forearm ||
+        forearm->GetParentNode() != upperArm || !upperArm->GetParentNode() || !retargeter.SourceOf(forearm) ||
+        !retargeter.SourceOf(upperArm))
         return std::nullopt;
     CFaithfulArm arm;
     arm.m_pkSourceHand = retargeter.SourceOf(hand);

@@ -46,6 +46,7 @@ std::vector<CFaithfulLeg> PlanLegs(const CRetargeter& retargeter, const CPoseMat
 std::vector<LegJoints> SourcesOf(const std::vector<CFaithfulLeg>& legs)
 {
     std::vector<LegJoints> sources;
+    sources.reserve(legs.size());
     for (const CFaithfulLeg& leg : legs)
         sources.push_back(leg.Source());
     return sources;
