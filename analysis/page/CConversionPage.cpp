@@ -25,7 +25,7 @@ void CConversionPage::AddWithoutFigures(const std::string& source, const std::st
 {
     CMarkup row;
     row.Raw("<tr><td class=\"word\">").FileName(source).Raw("</td><td class=\"word none\" colspan=\"");
-    row.Integer(static_cast<long long>(KeyFigureCount() + 1)).Raw("\">").Name(outcome).Raw("</td></tr>\n");
+    row.Integer(static_cast<long long>(KeyFigureCount()) + 1).Raw("\">").Name(outcome).Raw("</td></tr>\n");
     m_kRows.push_back({source, row.Text(), std::numeric_limits<double>::infinity()});
 }
 

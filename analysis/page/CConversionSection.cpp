@@ -150,7 +150,7 @@ void CConversionSection::AppendWorstFrames(CMarkup& page) const
                         result.Across(kRightBones.thigh, kLeftBones.thigh)};
         PlaceFigure(pair.source, motion_.measured->detail.sourceFloor, SourceScale(sums));
         PlaceFigure(pair.result, 0.0, 1.0);
-        page.Raw("<article><p><b class=\"number\">").Integer(static_cast<long long>(i + 1));
+        page.Raw("<article><p><b class=\"number\">").Integer(static_cast<long long>(i) + 1);
         page.Raw("</b> <b>Frame ").Integer(worst.frame).Raw("</b> ");
         AppendFault(page, worst);
         page.Raw("</p>\n");
