@@ -137,7 +137,7 @@ auto WordsFrom(char letter)
 constexpr uint32_t kSides = kLeft | kRight;
 constexpr uint32_t kLevels = kUp | kLow | kMid;
 
-// Features name a joint if they include all needed ones and none that are not allowed.
+// A name matches a joint if it has all required features and no forbidden one.
 struct Meaning
 {
     uint32_t needed;

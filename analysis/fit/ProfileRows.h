@@ -33,7 +33,7 @@ bool MayFit(std::string_view text, const CBoneNames& sources);
 /// Returns the bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 
-/// Returns the start shared by all rows' source names; empty if they share none or there are no rows.
+/// Returns the prefix that all source names have in common; may be empty.
 std::string SourcePrefix(const CMapRowTable& rows);
 /// Returns the rows with another prefix in place of that one in every source name.
 CMapRowTable WithPrefix(const CMapRowTable& rows, std::string_view oldPrefix, std::string_view newPrefix);

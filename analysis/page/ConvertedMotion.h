@@ -24,7 +24,7 @@ struct ConvertedMotion
     MotionClip sourceClip;
     MotionClip resultClip;
     const MeasuredConversion* measured = nullptr;
-    /// the same motion without options; null if there are no options
+    /// the same motion converted by default; null if this one was
     const MeasuredConversion* plain = nullptr;
 };
 

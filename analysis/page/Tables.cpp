@@ -68,7 +68,7 @@ const PartMeasures* PartOf(const MeasuredConversion& measured, std::string_view 
     return part == measured.detail.parts.end() ? nullptr : &*part;
 }
 
-// Appends the cell of the default conversion; the column remains if there is no such figure.
+// Appends the cell of the default conversion; without a figure the cell is empty.
 template <class Record>
 void PlainCell(CMarkup& page, const Record* record)
 {

@@ -18,7 +18,7 @@ public:
     /// one of the library's languages.
     void OpenLibrary(const std::string& path, uint32_t locale);
 
-    /// Loads the text of a message. Returns false if there is none or it begins with "*". In the library, "*"
+    /// Loads the text of a message. Returns false if it is missing or starts with "*". In the library, "*"
     /// marks a text that is not translated and comes from the program's table.
     bool LoadResString(int id, std::string& text) const;
 

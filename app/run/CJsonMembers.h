@@ -39,7 +39,7 @@ public:
     };
 
     /// Parses a whole text. Returns UnexpectedLine if it is not JSON, TooDeep if it is nested deeper than
-    /// kJsonDepthLimit; then there are no members.
+    /// kJsonDepthLimit. The list of members is then empty.
     EFailure Read(std::string_view text);
 
     /// Returns false for an array.

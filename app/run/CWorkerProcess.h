@@ -47,7 +47,7 @@ public:
     bool Receive(JobEnd& end);
     /// Kills the process and ends its job.
     void Kill(JobEnd& end);
-    /// Tells the process that there are no more jobs. It may take a moment to end.
+    /// Closes the process's job queue. The process may take a moment to exit.
     void Close();
 
 private:

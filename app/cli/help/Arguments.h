@@ -11,7 +11,7 @@ struct Arguments
 {
     const ShellCommand* command = nullptr;
     ShellOptions options;
-    EExit exit = EExit::Done; ///< used if there is no command
+    EExit exit = EExit::Done; ///< the exit code if no command is to run
 };
 
 /// Parses a command line. Help goes to standard output; errors go to standard error, with the most similar

@@ -53,7 +53,7 @@ private:
     // A count that belongs to the next field if that has the same name, and is a field by itself otherwise.
     struct PendingCount
     {
-        std::string_view name; ///< empty if there is no pending count
+        std::string_view name; ///< empty if no count is pending
         size_t count = 0;
     };
 

@@ -12,7 +12,7 @@ namespace {
 
 static_assert(sizeof(PackageFacts) == 16); // layout of the file
 
-// A chain is no longer than the number of objects in the file, and cycles are refused when it is read.
+// This ends: the reader refuses cycles, so a chain has at most as many links as the file has objects.
 CRawData* FindInChain(CCustomData* data, const char* name)
 {
     for (; data; data = data->GetNextData())

@@ -43,7 +43,7 @@ private:
     QLineEdit* m_pkPath = nullptr;
     QToolButton* m_pkUp = nullptr;
     QListView* m_pkFolders = nullptr;
-    QComboBox* m_pkFilter = nullptr; ///< null if there is no filter
+    QComboBox* m_pkFilter = nullptr; ///< null without a filter
     std::string m_kFolder;
 };
 
