@@ -11,6 +11,7 @@
 #include <algorithm>
 #include <array>
 #include <optional>
+#include <span>
 #include <string>
 
 namespace gw {
@@ -128,10 +129,11 @@ constexpr auto kSortedLexicon = [] {
     return words;
 }();
 
-auto WordsFrom(char letter)
+std::span<const Word> WordsFrom(char letter)
 {
-    return std::ranges::equal_range(kSortedLexicon, letter, {},
-                                    [](const Word& word) { return word.text.front(); });
+    const auto first = [](const Word& word) { return word.text.front(); };
+    const auto begin = std::ranges::lower_bound(kSortedLexicon, letter, {}, first);
+    return {begin, std::ranges::upper_bound(kSortedLexicon, letter, {}, first)};
 }
 
 constexpr uint32_t kSides = kLeft | kRight;
