@@ -33,7 +33,7 @@ void WriteNumbers(benchmark::State& state)
     std::chrono::duration<double> ours{};
     std::chrono::duration<double> library{};
     char text[kFixed6Bytes];
-    for (auto _ : state)
+    while (state.KeepRunning())
     {
         const Clock::time_point start = Clock::now();
         for (const float value : values)
@@ -61,7 +61,7 @@ void ReadNumbers(benchmark::State& state)
     std::chrono::duration<double> ours{};
     std::chrono::duration<double> library{};
     const char* end = text.data() + text.size();
-    for (auto _ : state)
+    while (state.KeepRunning())
     {
         const Clock::time_point start = Clock::now();
         ENumber kind;
@@ -97,7 +97,7 @@ void ReadContainer(benchmark::State& state)
 
     std::chrono::duration<double> copy{};
     std::chrono::duration<double> read{};
-    for (auto _ : state)
+    while (state.KeepRunning())
     {
         const Clock::time_point start = Clock::now();
         benchmark::DoNotOptimize(std::vector<std::byte>(bytes));

@@ -81,7 +81,7 @@ void Retarget(benchmark::State& state)
         return;
     }
     const std::clock_t start = std::clock();
-    for (auto _ : state)
+    while (state.KeepRunning())
         conversion.Run();
     const double spent = 1e6 * static_cast<double>(std::clock() - start) / CLOCKS_PER_SEC;
     state.counters["us/bone/frame"] = spent / (conversion.Steps() * static_cast<double>(state.iterations()));

@@ -50,6 +50,7 @@ std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
 {
     const auto& joints = tree.Joints();
     std::vector<CDoubledMeter> meters;
+    meters.reserve(joints.size());
     for (const CNode* joint : joints)
         meters.emplace_back(joint == motion.root ? kVec3Zero : RestLocal(*joint).Translation());
     const int count = std::min(motion.frameCount, kDoubledSamples);
@@ -64,6 +65,7 @@ std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
     // In a file with complete positions, nearly all joints repeat their offset; some of the others move.
     const bool areWhole = repeating * 2 >= around && repeating > 0;
     std::vector<bool> doubled;
+    doubled.reserve(meters.size());
     for (const CDoubledMeter& meter : meters)
         doubled.push_back(meter.Repeats() || (areWhole && meter.StandsAround()));
     return doubled;

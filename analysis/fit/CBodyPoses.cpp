@@ -70,7 +70,10 @@ void CBodyPoses::PlanFrames()
     const CKeyframeControl* const track = TrackOf(*body_.Leg(EBodySide::Left).thigh);
     const size_t count = track ? track->m_kKeyTimes.size() : 0;
     for (size_t i = 0; i < std::min(count, kFrameCount); ++i)
-        m_kFrames.push_back(static_cast<double>(i * (count - 1) / std::max<size_t>(kFrameCount - 1, 1)));
+    {
+        const size_t frame = i * (count - 1) / std::max<size_t>(kFrameCount - 1, 1);
+        m_kFrames.push_back(static_cast<double>(frame));
+    }
 }
 
 void CBodyPoses::Take(size_t pose)

@@ -146,7 +146,7 @@ bool CRowTurner::IsAtPole(size_t row, const RowNumbers& numbers) const
     {
         const Mat3 world = OffsetOf(numbers) * poses_.BoneTurn(stance, joints_[row]);
         const Mat3 hip = OffsetOf(m_kNumbers[kHip]) * poses_.BoneTurn(stance, joints_[kHip]);
-        const Mat3 pelvis = target_.RestTurn(kHostRows[row - 1 * isThigh].target) *
+        const Mat3 pelvis = target_.RestTurn(kHostRows[isThigh ? row - 1 : row].target) *
                             Mat3Transpose(target_.RestTurn(kHostRows[kHip].target));
         if (!IsGivenBack(isThigh ? world * Mat3Transpose(pelvis * hip) : world))
             return true;

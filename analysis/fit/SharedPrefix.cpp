@@ -3,6 +3,7 @@
 #include "Text.h"
 
 #include <algorithm>
+#include <cmath>
 
 namespace gw {
 
@@ -43,7 +44,7 @@ std::string LongestStart(std::span<const std::string> sorted, size_t count)
 std::vector<std::string> SharedPrefixes(std::span<const std::string> names)
 {
     names = names.first(std::min(names.size(), kNamesLooked));
-    const auto most = static_cast<size_t>(kNearlyAll * static_cast<double>(names.size()) + 0.5);
+    const auto most = static_cast<size_t>(std::lround(kNearlyAll * static_cast<double>(names.size())));
     if (most < kLeastNames)
         return {};
     std::vector<std::string> sorted(names.begin(), names.end());

@@ -130,8 +130,9 @@ bool CGaitToolDialog::IsPlaying() const
 int CGaitToolDialog::FrameOf(EToolMotion motion) const
 {
     const CMotionView* const view = View(motion);
-    const float step = view ? view->GetFrameStep() : 0.0f;
-    return step > 0.0f ? CutToInteger(std::round(view->GetTime() / step)) : 0;
+    if (!view || !(view->GetFrameStep() > 0.0f))
+        return 0;
+    return CutToInteger(std::round(view->GetTime() / view->GetFrameStep()));
 }
 
 int CGaitToolDialog::LastFrameOf(EToolMotion motion) const

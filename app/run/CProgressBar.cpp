@@ -6,6 +6,7 @@
 #include <algorithm>
 #include <array>
 #include <charconv>
+#include <cmath>
 #include <cstdio>
 
 #include <sys/ioctl.h>
@@ -31,7 +32,7 @@ std::string OneDecimal(double value)
 // "12s", "3m20s", "5h07m": at most two units.
 std::string Duration(double seconds)
 {
-    const auto whole = static_cast<long long>(std::clamp(seconds, 0.0, 1e9) + 0.5);
+    const auto whole = std::llround(std::clamp(seconds, 0.0, 1e9));
     const std::array<long long, 3> part = {whole / 3600, whole / 60 % 60, whole % 60};
     const size_t first = part[0] ? 0 : part[1] ? 1 : 2;
     std::string text = std::to_string(part[first]) + "hms"[first];

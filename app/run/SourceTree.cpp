@@ -85,7 +85,7 @@ void CWalk::Take(const std::string& below)
     {
         Identity identity;
         if (Identify(m_kFolder + below + name, identity) && m_kSeen.insert(identity).second)
-            Take(below + name + kPathSeparator);
+            Take(std::string(below).append(name) + kPathSeparator);
     }
 }
 

@@ -60,7 +60,7 @@ std::string ScratchPath(std::string_view name)
 
 std::string ScratchFile(std::string_view name, std::span<const std::byte> bytes)
 {
-    const std::string path = ScratchPath(name);
+    std::string path = ScratchPath(name);
     std::FILE* const file = std::fopen(path.c_str(), "wb");
     Require(file != nullptr, "the scratch folder takes files");
     const bool written = std::fwrite(bytes.data(), 1, bytes.size(), file) == bytes.size();

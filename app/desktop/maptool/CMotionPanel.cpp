@@ -56,7 +56,7 @@ QString MotionFileOf(const QMimeData& mime)
 {
     for (const QUrl& url : mime.urls())
     {
-        const QString path = url.toLocalFile();
+        QString path = url.toLocalFile();
         if (CGaitToolDialog::TakesFile(ToUtf8(path)))
             return path;
     }

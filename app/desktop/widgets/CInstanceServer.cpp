@@ -35,7 +35,7 @@ bool IsPrivate(const QString& path)
 // Returns a folder with the user's id in its name, created if necessary.
 QString OwnFolder()
 {
-    const QString path = QDir::tempPath() + QStringLiteral("/gaitwright-") + QString::number(geteuid());
+    QString path = QDir::tempPath() + QStringLiteral("/gaitwright-") + QString::number(geteuid());
     QDir().mkdir(path, QFile::ReadOwner | QFile::WriteOwner | QFile::ExeOwner);
     return path;
 }
