@@ -1,13 +1,9 @@
 #include "CBoneMesh.h"
-#include "CFactoryMap.h"
 #include "CNode.h"
 #include "MeshSamples.h"
 #include "SceneBytes.h"
-#include "TempFolder.h"
 
 #include <gtest/gtest.h>
-
-#include <filesystem>
 
 namespace gw {
 namespace {
@@ -23,6 +19,13 @@ CSceneBytes OddMesh(uint32_t presence)
     bytes.Words({1, presence, 0, 1, 2, 0, 0, 0, 0, 0});
     bytes.Words({2, 2, 0, 1, 9, uint32_t(-1), 3}); // maps, ranges
     bytes.Object("CTriMeshUVWMap", 2).Words({4, 0, 1, presence, 8, 8, 8, 0, 0});
+    return bytes;
+}
+
+// Adds the part that is common to all controls, without a target.
+CSceneBytes& Control(CSceneBytes& bytes, std::string_view className)
+{
+    bytes.Root().Object(className, 1).Word(1).Float(2).Float(3).Float(4).Float(5).Byte(1).Words({0, 0});
     return bytes;
 }
 
@@ -64,41 +67,6 @@ TEST(MeshFile, PointsBelowNoneAreNoneAndOtherBlocksBelowNoneAreDamage)
     EXPECT_EQ(stream.Record().Failure().reason, EFailure::BadCount);
 }
 
-TEST(MeshFile, EveryBlockComesBackAndDamageStaysInside)
-{
-    COrrinStream stream;
-    stream.AddRoot(FullMesh().Get());
-    ASSERT_TRUE(SurvivesRewriting(stream));
-    uint64_t size = 58 + 14;
-    for (const CObject* object : stream.ObjectsInSaveOrder())
-        size += object->GetDiskUsed();
-    const std::vector<std::byte> whole = SaveBytes(stream);
-    EXPECT_EQ(whole.size(), size);
-    for (const uint32_t word : {0xffffffffu, 0x15555556u})
-    {
-        for (size_t at = 0; at + 4 <= whole.size(); ++at)
-        {
-            std::vector<std::byte> bytes = whole;
-            std::memcpy(bytes.data() + at, &word, 4);
-            COrrinStream damaged;
-            if (!damaged.LoadBuffer(bytes, 0))
-                continue;
-            ASSERT_TRUE(SurvivesRewriting(damaged)) << word << " at " << at;
-            if (CTriMesh* mesh = RecordCast<CTriMesh>(damaged.GetRoot(0)))
-            {
-                mesh->UpdateScene(0.0f, true);
-                mesh->BuildVertexTable();
-            }
-        }
-    }
-    for (size_t end = 0; end < whole.size(); ++end)
-    {
-        COrrinStream cut;
-        const bool loaded = LoadBytes(cut, std::span(whole).first(end));
-        ASSERT_EQ(loaded, !cut.Record().Failure());
-    }
-}
-
 TEST(MeshFile, ABoneMeshIsWrittenAndNotReadBack)
 {
     const Ref<CBoneShapeMesh> mesh = new CBoneShapeMesh;
@@ -130,48 +98,67 @@ TEST(Clone, MeshesShareTheCopyOfWhatTheyShare)
     root->AttachChild(second.Get());
     CCloneMap map;
     const Ref<CNode> copy = static_cast<CNode*>(root->Clone(map));
-    COrrinStream source;
-    COrrinStream copied;
-    source.AddRoot(root.Get());
-    copied.AddRoot(copy.Get());
-    EXPECT_EQ(Describe(copied), Describe(source));
-    CTriMesh& one = static_cast<CTriMesh&>(*copy->ChildAt(0));
-    EXPECT_EQ(one.GetMaterial()->GetRefCount(), 2u);
-    EXPECT_NE(one.GetMaterial(), first->GetMaterial());
-    EXPECT_EQ(one.m_apkUVWMap[2]->GetRefCount(), 2u);
+    EXPECT_EQ(DescribeRoot(copy.Get()), DescribeRoot(root.Get()));
+    EXPECT_NE(static_cast<CTriMesh&>(*copy->ChildAt(0)).GetMaterial(), first->GetMaterial());
     const Ref<CTriMesh> bare = static_cast<CTriMesh*>(first->CreateClone());
     EXPECT_EQ(bare->GetMaterial(), nullptr);
 }
 
-// Containers from another writer of the format: valid ones keep their graph, all others do no harm.
-TEST(ForeignContainers, SurviveLoadingAndSaving)
+TEST(ControlFile, PointsOfASkinAreSortedAndOneRecordEach)
 {
-    const std::string folder = SharedDataFolder();
-    if (folder.empty())
-        GTEST_SKIP() << "no shared data here";
-    size_t whole = 0;
-    for (const auto& entry : std::filesystem::recursive_directory_iterator(folder + "containers"))
-    {
-        if (!entry.is_regular_file() || entry.path().extension() == ".json")
-            continue;
-        SCOPED_TRACE(entry.path().filename());
-        COrrinStream stream;
-        const bool loaded = stream.LoadFile(entry.path(), false);
-        const bool damaged = static_cast<bool>(stream.Record().Failure());
-        EXPECT_TRUE(SurvivesRewriting(stream));
-        const std::string kind = entry.path().parent_path().filename();
-        EXPECT_FALSE(loaded && kind == "refused");
-        for (size_t root = 0; root < stream.GetRootCount(); ++root)
-        {
-            if (CSpatial* spatial = RecordCast<CSpatial>(stream.GetRoot(root)))
-                spatial->UpdateScene(1.5f, true);
-        }
-        if (damaged || (kind != "good" && kind != "source" && kind != "package"))
-            continue;
-        EXPECT_EQ(SaveBytes(stream).size() + 21, entry.file_size());
-        ++whole;
-    }
-    EXPECT_GT(whole, 30u);
+    CSceneBytes mixed = Scene();
+    const auto point = [&](uint32_t index, float weight) {
+        mixed.Words({index, 1, 0}).Float(weight).Add(kMat4Identity);
+    };
+    Control(mixed, "CSkinBoneControl").Word(3);
+    point(8, 1);
+    point(2, 2);
+    point(8, 3);
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, mixed.Bytes()));
+    const auto& sorted = static_cast<const CSkinBoneControl&>(*stream.GetRoot(0)).Points();
+    ASSERT_EQ(sorted.size(), 2u) << "one record per point";
+    EXPECT_EQ(sorted[0].m_uiIndex, 2u);
+    EXPECT_EQ(sorted[1].m_kEntries[1].m_fWeight, 3.0f);
+}
+
+TEST(ControlFile, ASceneOfAllClassesComesBackByCloneAndByFile)
+{
+    const Ref<CNode> scene = ControlledScene();
+    ExpectComesBack(scene.Get());
+    CCloneMap map;
+    const Ref<CObject> copy = scene->Clone(map);
+    EXPECT_EQ(DescribeRoot(copy.Get()), DescribeRoot(scene.Get())) << "bones and meshes are copies, too";
+    const CObject* mesh = copy->FindObject(nullptr, &CTriMesh::ms_kRTTI, false);
+    CConnectControl* seam =
+        static_cast<CConnectControl*>(copy->FindObject(nullptr, &CConnectControl::ms_kRTTI, false));
+    EXPECT_EQ(seam->m_spkConnectData->m_kFirst.m_pkMesh.Get(), mesh);
+}
+
+TEST(ControlFile, NoDamageReachesOutsideOrStaysInAnUpdate)
+{
+    const auto use = [](CObject& root) {
+        std::vector<CObject*> meshes;
+        root.FindObjects(meshes, nullptr, &CTriMesh::ms_kRTTI, false);
+        if (CSpatial* spatial = RecordCast<CSpatial>(&root))
+            spatial->UpdateScene(1.5f, true);
+        for (CObject* mesh : meshes)
+            static_cast<CTriMesh*>(mesh)->BuildVertexTable();
+        if (CSpatial* spatial = RecordCast<CSpatial>(&root))
+            spatial->UpdateScene(2.5f, true);
+    };
+    ExpectDamageStaysInside(ControlledScene().Get(), {0xffffffffu, 0x7f800000u, 0u}, use);
+}
+
+TEST(ControlFile, MeshesAndBonesThatDieLeaveNothingBehind)
+{
+    Ref<CNode> scene = ControlledScene();
+    const Ref<CTriMesh> mesh = static_cast<CTriMesh*>(scene->ChildAt(0));
+    scene = nullptr; // deletes the bone and the other mesh too
+    mesh->UpdateScene(1.5f, true);
+    mesh->UpdateScene(2.5f, true);
+    const auto& skin = static_cast<const CBoneSkinControl&>(*mesh->GetControl());
+    EXPECT_FALSE(skin.Bones()[0].m_pkBone);
 }
 
 } // namespace gw

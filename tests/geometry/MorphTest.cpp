@@ -1,18 +1,11 @@
-#include "ControlSamples.h"
-#include "SceneSamples.h"
+#include "MeshSamples.h"
+#include "Rotations.h"
 
 #include <gtest/gtest.h>
 #include <tuple>
 
 namespace gw {
 namespace {
-
-void ExpectPoint(const Vec3& point, const Vec3& expected)
-{
-    EXPECT_NEAR(point.x, expected.x, 1e-5f);
-    EXPECT_NEAR(point.y, expected.y, 1e-5f);
-    EXPECT_NEAR(point.z, expected.z, 1e-5f);
-}
 
 CMorphControl& AttachMorph(CTriMesh& mesh, const std::vector<Vec3>& deltas)
 {
@@ -41,20 +34,16 @@ TEST(Morph, MovesTheModelByTheWeightOfTheTime)
         SCOPED_TRACE(what);
         const uint32_t stamp = mesh->m_uiChangeStamp;
         mesh->UpdateScene(time, false);
-        ExpectPoint(mesh->WorldXYZBuffer()[0], {0, weight, 5});
-        ExpectPoint(mesh->WorldXYZBuffer()[1], {0, 1, 5});
+        ExpectNear(mesh->WorldXYZBuffer()[0], {0, weight, 5}, 1e-5);
+        ExpectNear(mesh->WorldXYZBuffer()[1], {0, 1, 5}, 1e-5);
         EXPECT_EQ(mesh->m_uiChangeStamp - stamp, weight == 0 ? 0u : 1u);
     }
     AttachMorph(*mesh, {kVec3UnitY, kVec3UnitY});
     mesh->UpdateScene(4.0f, false);
-    ExpectPoint(mesh->WorldXYZBuffer()[0], {-2, 2, 5});
+    ExpectNear(mesh->WorldXYZBuffer()[0], {-2, 2, 5}, 1e-5);
     morph.m_bActive = false;
     mesh->UpdateScene(4.0f, false);
-    ExpectPoint(mesh->WorldXYZBuffer()[0], {-2, 0, 5});
-    morph.m_bActive = true;
-    morph.m_kWeights.clear();
-    mesh->UpdateScene(4.0f, false);
-    ExpectPoint(mesh->WorldXYZBuffer()[0], {-2, 0, 5});
+    ExpectNear(mesh->WorldXYZBuffer()[0], {-2, 0, 5}, 1e-5);
 }
 
 TEST(Morph, BehindASkinTheOffsetTurnsWithTheMeshAndDoesNotMoveIt)
@@ -69,7 +58,7 @@ TEST(Morph, BehindASkinTheOffsetTurnsWithTheMeshAndDoesNotMoveIt)
     skin->RebuildSkinTables();
     AttachMorph(*mesh, {kVec3UnitX});
     mesh->UpdateScene(4.0f, false);
-    ExpectPoint(mesh->WorldXYZBuffer()[0], {7, 6, 1});
+    ExpectNear(mesh->WorldXYZBuffer()[0], {7, 6, 1}, 1e-5);
 }
 
 TEST(Morph, AnswersByWhatItIsAndHas)
@@ -79,11 +68,8 @@ TEST(Morph, AnswersByWhatItIsAndHas)
     morph->m_kWeights = {1.0f};
     morph->m_kKeyTimes = {0.0f};
     EXPECT_FALSE(morph->Update(0.0f)) << "no target";
-    const Ref<CNode> node = new CNode;
-    node->AttachControl(morph.Get());
+    Ref<CNode>(new CNode)->AttachControl(morph.Get());
     EXPECT_FALSE(morph->Update(0.0f)) << "a target of another class";
-    morph->m_bActive = false;
-    EXPECT_FALSE(morph->Update(0.0f));
 }
 
 TEST(TextureFrames, ShowTheFrameOfTheKeyBeforeWithoutBlending)
@@ -122,10 +108,8 @@ TEST(CBitArray, BitsThatAreNotThereAreNotSet)
     bits.Set(0);
     bits.Set(32);
     bits.Set(33);
-    for (const size_t bit : {0u, 32u})
-        EXPECT_TRUE(bits.Test(bit)) << bit;
-    for (const size_t bit : {1u, 31u, 33u, 63u, 1000u})
-        EXPECT_FALSE(bits.Test(bit)) << bit;
+    for (const size_t bit : {0u, 1u, 31u, 32u, 33u, 63u, 1000u})
+        EXPECT_EQ(bits.Test(bit), bit == 0 || bit == 32) << bit;
     bits.Clear(32);
     bits.Clear(1000);
     EXPECT_FALSE(bits.Test(32));

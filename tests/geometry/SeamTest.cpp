@@ -1,5 +1,5 @@
-#include "ControlSamples.h"
-#include "SceneSamples.h"
+#include "MeshSamples.h"
+#include "Rotations.h"
 
 #include <gtest/gtest.h>
 
@@ -8,13 +8,6 @@
 
 namespace gw {
 namespace {
-
-void ExpectVector(const Vec3& v, const Vec3& expected)
-{
-    EXPECT_NEAR(v.x, expected.x, 1e-4f);
-    EXPECT_NEAR(v.y, expected.y, 1e-4f);
-    EXPECT_NEAR(v.z, expected.z, 1e-4f);
-}
 
 const float kDiagonal = std::sqrt(0.5f);
 
@@ -82,12 +75,12 @@ TEST_F(TwoMeshes, ASeamClosesWhenTheSecondMeshHasReachedTheTime)
     EXPECT_EQ(m_kFirst->WorldXYZBuffer()[0], kVec3Zero) << "the other is not there yet";
     const uint32_t stamp = m_kFirst->m_uiChangeStamp;
     Update(1.0f);
-    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0});
-    ExpectVector(m_kSecond->WorldXYZBuffer()[0], {1, 0, 0});
-    ExpectVector(m_kFirst->WorldXYZBuffer()[1], {1, 0, 0});
+    ExpectNear(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0}, 1e-4);
+    ExpectNear(m_kSecond->WorldXYZBuffer()[0], {1, 0, 0}, 1e-4);
+    ExpectNear(m_kFirst->WorldXYZBuffer()[1], {1, 0, 0}, 1e-4);
     for (CTriMesh* mesh : {m_kFirst.Get(), m_kSecond.Get()})
-        ExpectVector(mesh->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal});
-    ExpectVector(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ);
+        ExpectNear(mesh->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal}, 1e-4);
+    ExpectNear(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ, 1e-4);
     EXPECT_GT(m_kFirst->m_uiChangeStamp, stamp);
 }
 
@@ -97,14 +90,14 @@ TEST_F(TwoMeshes, ASeamStaysOpenForOtherTimesAndForASideThatIsOff)
     CControl& control = *m_kSecond->GetControl();
     control.m_fPhase = 1.0f;
     Update(2.0f);
-    ExpectVector(m_kFirst->WorldXYZBuffer()[0], kVec3Zero);
+    ExpectNear(m_kFirst->WorldXYZBuffer()[0], kVec3Zero, 1e-4);
     control.m_fPhase = 0.0f;
     control.m_bActive = false;
     Update(5.0f);
-    ExpectVector(m_kFirst->WorldXYZBuffer()[0], kVec3Zero);
+    ExpectNear(m_kFirst->WorldXYZBuffer()[0], kVec3Zero, 1e-4);
     control.m_bActive = true;
     Update(5.0f);
-    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0});
+    ExpectNear(m_kFirst->WorldXYZBuffer()[0], {1, 0, 0}, 1e-4);
 }
 
 TEST_F(TwoMeshes, APointNamedTwiceMovesTwiceAndOneThatIsNotThereNever)
@@ -115,9 +108,9 @@ TEST_F(TwoMeshes, APointNamedTwiceMovesTwiceAndOneThatIsNotThereNever)
     m_kSecond->m_kMatrix = Moved(4, 0, 0);
     m_kSeam->m_kSecond.m_kPoints[1] = 1; // at 5
     Update(1.0f);
-    ExpectVector(m_kFirst->WorldXYZBuffer()[0], {3.5f, 0, 0});
-    ExpectVector(m_kSecond->WorldXYZBuffer()[0], {2, 0, 0});
-    ExpectVector(m_kSecond->WorldXYZBuffer()[1], {3.5f, 0, 0});
+    ExpectNear(m_kFirst->WorldXYZBuffer()[0], {3.5f, 0, 0}, 1e-4);
+    ExpectNear(m_kSecond->WorldXYZBuffer()[0], {2, 0, 0}, 1e-4);
+    ExpectNear(m_kSecond->WorldXYZBuffer()[1], {3.5f, 0, 0}, 1e-4);
 }
 
 TEST_F(TwoMeshes, NormalsAreSmoothedWhereOtherMeshesAreNear)
@@ -125,14 +118,14 @@ TEST_F(TwoMeshes, NormalsAreSmoothedWhereOtherMeshesAreNear)
     AttachSmoothing(1.25f);
     // The first mesh's normal 1 is at (1, 0, 0), the second's 0 at (2, 0, 0); all others are farther apart.
     Update(1.0f);
-    ExpectVector(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ);
-    ExpectVector(m_kFirst->WorldNormalBuffer()[1], {kDiagonal, 0, kDiagonal});
-    ExpectVector(m_kSecond->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal});
-    ExpectVector(m_kSecond->WorldNormalBuffer()[2], kVec3UnitX); // not selected
+    ExpectNear(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ, 1e-4);
+    ExpectNear(m_kFirst->WorldNormalBuffer()[1], {kDiagonal, 0, kDiagonal}, 1e-4);
+    ExpectNear(m_kSecond->WorldNormalBuffer()[0], {kDiagonal, 0, kDiagonal}, 1e-4);
+    ExpectNear(m_kSecond->WorldNormalBuffer()[2], kVec3UnitX, 1e-4); // not selected
 
     m_kSmoothing->m_fThreshold = 1.0f; // strictly below
     Update(2.0f);
-    ExpectVector(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ);
+    ExpectNear(m_kFirst->WorldNormalBuffer()[1], kVec3UnitZ, 1e-4);
 }
 
 TEST_F(TwoMeshes, ASelectedNormalThatNoCornerNamesBecomesZero)
@@ -140,55 +133,53 @@ TEST_F(TwoMeshes, ASelectedNormalThatNoCornerNamesBecomesZero)
     AttachSmoothing(0.1f);
     m_kFirst->NormalTriIndexBuffer()[1] = 0;
     Update(1.0f);
-    ExpectVector(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ);
+    ExpectNear(m_kFirst->WorldNormalBuffer()[0], kVec3UnitZ, 1e-4);
     EXPECT_EQ(m_kFirst->WorldNormalBuffer()[1], kVec3Zero);
 }
 
 // Compares the literal rule, over every pair, with the result of the cells.
 TEST(Smoothing, CellsFindWhatIsNearAndNothingElse)
 {
+    struct Corner
+    {
+        Vec3 place;
+        Vec3 normal;
+    };
     std::mt19937 random(3);
     std::uniform_real_distribution<float> place(-4.0f, 4.0f);
     const Ref<CEditNormalData> smoothing = new CEditNormalData;
     smoothing->m_fThreshold = 0.75f;
     smoothing->m_kMeshes.resize(3);
     std::vector<Ref<CTriMesh>> meshes;
+    std::vector<Corner> corners; // 99 of each mesh
     for (CEditNormalData::Record& record : smoothing->m_kMeshes)
     {
-        Ref<CTriMesh> mesh = PointMesh(std::vector<Vec3>(99));
-        for (Vec3& point : mesh->XYZBuffer())
-            point = {place(random), place(random), place(random) * 0.1f};
+        const Ref<CTriMesh>& mesh = meshes.emplace_back(PointMesh(std::vector<Vec3>(99)));
         mesh->SetNormalCount(99);
         mesh->SetTriangleQuantity(33);
-        for (uint32_t corner = 0; corner < 99; ++corner)
-            mesh->XYZTriIndexBuffer()[corner] = mesh->NormalTriIndexBuffer()[corner] = corner;
-        mesh->UpdateScene(0.0f, false);
         record.m_pkMesh.Set(mesh.Get());
         record.m_kNormals = CBitArray(99);
-        for (size_t normal = 0; normal < 99; ++normal)
-            record.m_kNormals.Set(normal);
-        meshes.push_back(mesh);
-    }
-    std::vector<Vec3> expected;
-    for (const auto& mesh : meshes)
-    {
-        for (size_t i = 0; i < 99; ++i)
+        for (uint32_t corner = 0; corner < 99; ++corner)
         {
-            Vec3 sum = mesh->WorldNormalBuffer()[i];
-            for (const auto& other : meshes)
-            {
-                for (size_t k = 0; k < 99 && !(other == mesh); ++k)
-                {
-                    if (Vec3Length(mesh->WorldXYZBuffer()[i] - other->WorldXYZBuffer()[k]) < 0.75)
-                        sum = sum + other->WorldNormalBuffer()[k];
-                }
-            }
-            expected.push_back(Vec3Normalized(sum));
+            mesh->XYZBuffer()[corner] = {place(random), place(random), place(random) * 0.1f};
+            mesh->XYZTriIndexBuffer()[corner] = mesh->NormalTriIndexBuffer()[corner] = corner;
+            record.m_kNormals.Set(corner);
         }
+        mesh->UpdateScene(0.0f, false);
+        for (size_t corner = 0; corner < 99; ++corner)
+            corners.push_back({mesh->WorldXYZBuffer()[corner], mesh->WorldNormalBuffer()[corner]});
     }
     EXPECT_TRUE(smoothing->Update(0.0f));
-    for (size_t i = 0; i < expected.size(); ++i)
-        ExpectVector(meshes[i / 99]->WorldNormalBuffer()[i % 99], expected[i]);
+    for (size_t i = 0; i < corners.size(); ++i)
+    {
+        Vec3 sum = corners[i].normal;
+        for (size_t k = 0; k < corners.size(); ++k)
+        {
+            if (k / 99 != i / 99 && Vec3Length(corners[i].place - corners[k].place) < 0.75)
+                sum = sum + corners[k].normal;
+        }
+        ExpectNear(meshes[i / 99]->WorldNormalBuffer()[i % 99], Vec3Normalized(sum), 1e-4);
+    }
     meshes[1]->m_bNormalsValid = false;
     EXPECT_FALSE(smoothing->Update(0.0f)) << "one mesh is behind";
 }

@@ -1,12 +1,12 @@
 // The table of drivers, and BMP files: every depth, both directions, files and streams, and files that are
 // not BMP.
 
-#include "CBMPPicture.h"
+#include "DriverSamples.h"
 #include "PicFileType.h"
-#include "PicProcs.h"
 #include "TempFolder.h"
 
 #include <cstdio>
+#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <tuple>
 #include <unistd.h>
@@ -83,15 +83,6 @@ std::string RowText(CPicture& picture, int y)
     return picture.ReadRowRGBA(y, 0, picture.Box().width, pixels.data()) ? Text(pixels) : "none";
 }
 
-// Returns all rows, one per line.
-std::string RowsText(CPicture& picture)
-{
-    std::string text;
-    for (int y = 0; y < picture.Box().height; ++y)
-        text += RowText(picture, y) + "\n";
-    return text;
-}
-
 class DriverTest : public testing::Test
 {
 protected:
@@ -105,30 +96,35 @@ protected:
     CTempFolder m_kFolder;
 };
 
-// Temporarily replaces the standard input by a file or a pipe.
+// Temporarily replaces the standard input by a file or by a pipe with its bytes.
 class StandardInput
 {
 public:
-    StandardInput(const std::string& path, bool pipe) : m_iSaved(dup(0))
+    StandardInput(const std::string& path, bool piped) : m_iSaved(dup(0))
     {
-        m_pkPipe = pipe ? popen(("cat '" + path + "'").c_str(), "r") : std::fopen(path.c_str(), "rb");
-        dup2(fileno(m_pkPipe), 0);
-        m_bPipe = pipe;
+        int ends[2] = {open(path.c_str(), O_RDONLY), -1};
+        if (piped)
+        {
+            const std::string bytes = ReadBytes(path); // few enough for a pipe to hold
+            close(ends[0]);
+            EXPECT_EQ(pipe(ends), 0);
+            EXPECT_EQ(write(ends[1], bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
+            close(ends[1]);
+        }
+        dup2(ends[0], 0);
+        close(ends[0]);
         std::clearerr(stdin);
     }
     ~StandardInput()
     {
         dup2(m_iSaved, 0);
         close(m_iSaved);
-        m_bPipe ? pclose(m_pkPipe) : std::fclose(m_pkPipe);
         // Discards data that was read ahead from the old input.
         EXPECT_NE(std::freopen("/dev/null", "rb", stdin), nullptr);
     }
 
 private:
     int m_iSaved;
-    bool m_bPipe;
-    std::FILE* m_pkPipe;
 };
 
 TEST_F(DriverTest, BMPReadsEveryDepth)
@@ -137,7 +133,15 @@ TEST_F(DriverTest, BMPReadsEveryDepth)
                             const std::string& pixels, std::string_view single) {
         SCOPED_TRACE(depth);
         const auto width = static_cast<int>(single.size());
-        const auto picture = Open(MadeBMP{width, 1, depth, palette, std::string(row)}.Bytes());
+        const std::string bytes = MadeBMP{width, 1, depth, palette, std::string(row)}.Bytes();
+        testing::internal::CaptureStderr();
+        for (size_t end = 0; end < bytes.size(); ++end)
+        {
+            if (const auto cut = Open(bytes.substr(0, end))) // does no harm
+                RowText(*cut, 0);
+        }
+        testing::internal::GetCapturedStderr();
+        const auto picture = Open(bytes);
         ASSERT_TRUE(picture);
         EXPECT_EQ(picture->ChannelCount(), 3);
         EXPECT_EQ(picture->Box().width, width);
@@ -173,8 +177,8 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAFileInItsOrder)
         ASSERT_TRUE(picture);
         EXPECT_EQ(picture->Box().height, 3);
         EXPECT_EQ(picture->IsBottomFirst(), height > 0);
-        EXPECT_EQ(RowsText(*picture), "010101.ff\n020202.ff\n030303.ff\n");
-        EXPECT_EQ(RowText(*picture, 1), "020202.ff");
+        EXPECT_EQ(RowText(*picture, 2), "030303.ff");
+        EXPECT_EQ(RowText(*picture, 0), "010101.ff");
         EXPECT_EQ(RowText(*picture, 3), "none");
         EXPECT_EQ(RowText(*picture, -1), "none");
         uint8_t pixels[2];
@@ -262,31 +266,6 @@ TEST_F(DriverTest, BMPRefusesInItsOwnWords)
     expect("an older header", good.substr(0, 14) + '\x0c' + good.substr(15), "");
 }
 
-// Tries every prefix of a file, and every byte of its header at its extremes, under the sanitizers.
-TEST_F(DriverTest, BMPSurvivesDamage)
-{
-    testing::internal::CaptureStderr();
-    const auto readRows = [&](const std::string& bytes) {
-        const auto picture = Open(bytes);
-        for (int y = 0; picture && y < std::min(3, picture->Box().height); ++y)
-            RowText(*picture, y);
-        return picture != nullptr;
-    };
-    for (const auto& [depth, height] : {std::pair<uint16_t, int>(1, 2), {4, -2}, {24, 2}, {32, -2}})
-    {
-        const size_t colors = depth < 16 ? size_t{1} << depth : 0;
-        const std::string good = MadeBMP{3, height, depth, Colors(colors), std::string(24, 'x')}.Bytes();
-        for (size_t end = 0; end < good.size(); ++end)
-            EXPECT_LE(readRows(good.substr(0, end)), end > 54 + 4 * colors) << end;
-        for (size_t at = 10; at < 54; ++at)
-        {
-            for (const char value : {'\0', '\x7f', '\x80', '\xff'})
-                readRows(std::string(good).replace(at, 1, 1, value));
-        }
-    }
-    testing::internal::GetCapturedStderr();
-}
-
 TEST_F(DriverTest, BMPIsWrittenTopDown)
 {
     auto picture = OpenPicture(Path(), "w");
@@ -308,29 +287,18 @@ TEST_F(DriverTest, BMPIsWrittenTopDown)
     EXPECT_EQ(ReadBytes(Path()), expected);
 }
 
-TEST_F(DriverTest, BMPOfOneChannelComesBackInGrey)
+TEST_F(DriverTest, BMPOfOneChannelIsGreyAndTellsThatRowsAreMissing)
 {
     auto picture = OpenPicture(Path(), "w");
     ASSERT_TRUE(picture);
     EXPECT_FALSE(picture->SetChannelCount(2));
-    ASSERT_TRUE(picture->SetChannelCount(1));
-    ASSERT_TRUE(picture->SetSize({0, 0, 3, 1}));
-    const PixelRGBA pixels[] = {{0, 0, 0, 9}, {255, 255, 255, 0}, {100, 100, 100, 0}};
-    ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 3, pixels));
-    EXPECT_TRUE(picture->Close());
-    picture = OpenPicture(Path(), "r");
-    ASSERT_TRUE(picture);
-    EXPECT_EQ(RowsText(*picture), "000000.ff ffffff.ff 646464.ff\n");
-}
-
-TEST_F(DriverTest, BMPTellsThatRowsAreMissing)
-{
-    auto picture = OpenPicture(Path(), "w");
-    ASSERT_TRUE(picture && picture->SetSize({0, 0, 1, 2}));
-    const uint8_t grey[] = {9};
-    ASSERT_TRUE(picture->WriteRow(0, 0, 1, grey));
+    ASSERT_TRUE(picture->SetChannelCount(1) && picture->SetSize({0, 0, 1, 2}));
+    const PixelRGBA red{255, 0, 0, 9};
+    ASSERT_TRUE(picture->WriteRowRGBA(0, 0, 1, &red));
     EXPECT_FALSE(picture->Close());
-    EXPECT_EQ(ReadBytes(Path()).size(), 58u) << "what was written stays";
+    EXPECT_EQ(ReadBytes(Path())[28], 8) << "bits of a pixel";
+    EXPECT_EQ(ReadBytes(Path()).substr(54), std::string("\x4c\0\0\0", 4)) << "what was written stays";
+    EXPECT_EQ(RowText(*Open(MadeBMP{2, 1, 8, {}, "\x4c\xff\x01\x01"}.Bytes()), 0), "4c4c4c.ff ffffff.ff");
     EXPECT_FALSE(OpenPicture(Path("none/a.bmp"), "w"));
     EXPECT_FALSE(OpenPicture(Path(), "x"));
 }
@@ -342,20 +310,10 @@ TEST_F(DriverTest, SinglePixelsAreNotSupported)
     ASSERT_TRUE(bmp);
     CPicture* const picture = bmp->open(Path().c_str(), "r");
     ASSERT_TRUE(picture);
-    testing::internal::CaptureStderr();
-    bmp->clear(picture, 1);
-    bmp->clearRGBA(picture, {});
-    bmp->writePixel(picture, 0, 0, 1);
-    bmp->writePixelRGBA(picture, 0, 0, {});
-    EXPECT_EQ(bmp->readPixel(picture, 0, 0), 0);
-    EXPECT_EQ(bmp->readPixelRGBA(picture, 0, 0), PixelRGBA{});
-    EXPECT_EQ(testing::internal::GetCapturedStderr(),
+    EXPECT_EQ(WordsOfSinglePixels(*bmp, picture),
               "?picbmp_write_pixel\n?picbmp_write_pixel_rgba\n?picbmp_read_pixel\n?picbmp_read_pixel_rgba\n");
     EXPECT_EQ(bmp->getName(picture), Path());
     EXPECT_FALSE(bmp->nextPicture(picture));
-    PixelRGBA pixel{};
-    EXPECT_TRUE(bmp->readRowRGBA(picture, 0, 0, 1, &pixel));
-    EXPECT_EQ(pixel, (PixelRGBA{'3', '2', '1', 255}));
     EXPECT_TRUE(bmp->close(picture));
 }
 
@@ -366,10 +324,9 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
         drivers.append(driver.name).append(" ");
     EXPECT_EQ(drivers, "bmp gif ");
 
-    const std::tuple<const char*, std::string_view> names[] = {
-        {"a.bmp", "bmp"},  {"-.bmp", "bmp"}, {"a.b.GIF", "gif"}, {"a.PJpeg", "jpg"},
-        {"a.tiff", "tif"}, {"a.ppm", "pnm"}, {"a.Z", "rle"},     {"a", "none"},
-        {"a.", "none"},    {"bmp", "none"},  {"a.txt", "none"},
+    const std::pair<const char*, std::string_view> names[] = {
+        {"-.bmp", "bmp"}, {"a.b.GIF", "gif"}, {"a.PJpeg", "jpg"}, {"a.ppm", "pnm"},
+        {"a.Z", "rle"},   {"a.", "none"},     {"bmp", "none"},
     };
     for (const auto& [name, wanted] : names)
     {
@@ -379,9 +336,11 @@ TEST_F(DriverTest, KnowsFileTypesByNameAndBytes)
     EXPECT_EQ(FindPictureType("a.Z")->magic, 0x1f9d);
     EXPECT_EQ(FindPictureType("a.z")->magic, 0x1f8b);
 
-    const std::tuple<std::string_view, const char*> heads[] = {
-        {"BM123", "bmp"},  {"\x50\x88", "dump"}, {"-\xcc\x52", "rle"},
-        {"\x1f\x8b", "z"}, {"\xcc\x52-", ""},    {"B", ""},
+    const std::pair<std::string_view, const char*> heads[] = {
+        {"BM123", "bmp"},
+        {"-\xcc\x52", "rle"},
+        {"\xcc\x52-", ""},
+        {"B", ""},
     };
     for (const auto& [bytes, extension] : heads)
     {

@@ -2,7 +2,6 @@
 #include "CAnmImageControl.h"
 #include "CImage.h"
 #include "MaterialSamples.h"
-#include "Paths.h"
 #include "SceneBytes.h"
 #include "TempFolder.h"
 
@@ -16,36 +15,28 @@ namespace gw {
 TEST(PictureFiles, FormatsKeepPixelsAndResolution)
 {
     // resolution: 96 if the format does not store it
-    const std::tuple<const char*, int32_t, int, int32_t> rows[] = {
-        {"a.png", 0, 0, 300}, {"a.PNG", 1, 0, 300}, {"a.bmp", 0, 0, 300}, {"a.tga", 1, 0, 96},
-        {"a.tif", 0, 0, 300}, {"a.gif", 0, 2, 96},  {"a.jpg", 1, 6, 300}, {"a.jpeg", 0, 6, 300},
-        {"a.pcx", 1, 0, 300}, {"a.ppm", 1, 0, 96},
+    const std::tuple<const char*, int32_t, int, int32_t, bool> rows[] = {
+        {"a.png", 0, 0, 300, true},  {"a.PNG", 1, 0, 300, true},   {"a.bmp", 0, 0, 300, true},
+        {"a.tga", 1, 0, 96, true},   {"a.tif", 0, 0, 300, true},   {"a.gif", 0, 2, 96, false},
+        {"a.jpg", 1, 6, 300, false}, {"a.jpeg", 0, 6, 300, false}, {"a.pcx", 1, 0, 300, false},
+        {"a.ppm", 1, 0, 96, false},
     };
     const CTempFolder folder;
-    for (const auto& [name, format, tolerance, resolution] : rows)
+    for (const auto& [name, format, tolerance, resolution, hasAlpha] : rows)
     {
         SCOPED_TRACE(name);
+        const std::string path = folder.Path(name);
         const Ref<CImage> image = Halves(format);
         image->Pixels().SetResolution(72, 300);
-        ASSERT_TRUE(image->Save(folder.Path(name), 95));
+        ASSERT_TRUE(image->Save(path, 95));
         const Ref<CImage> again = new CImage;
-        ASSERT_TRUE(again->Load(folder.Path(name)));
+        ASSERT_TRUE(again->Load(path));
         EXPECT_TRUE(ShowsHalves(*again, tolerance));
         EXPECT_NEAR(again->Pixels().Layout().m_iVerticalResolution, resolution, 1);
-    }
-}
-
-TEST(PictureFiles, KeepAlphaWhereTheFormatHasIt)
-{
-    const CTempFolder folder;
-    for (const char* name : {"a.png", "a.tga", "a.tif", "a.bmp"})
-    {
         const uint8_t pixel[4] = {200, 100, 50, 7};
-        const Ref<CImage> image = new CImage;
         image->Pixels().Create(5, 5, 0, pixel);
-        ASSERT_TRUE(image->Save(folder.Path(name), 95));
-        ASSERT_TRUE(image->Load(folder.Path(name)));
-        EXPECT_EQ(std::memcmp(CPixelView(image->Pixels()).Row(4), pixel, 4), 0) << name;
+        ASSERT_TRUE(image->Save(path, 95) && image->Load(path));
+        EXPECT_TRUE(!hasAlpha || std::memcmp(CPixelView(image->Pixels()).Row(4), pixel, 4) == 0);
     }
 }
 
@@ -78,7 +69,6 @@ TEST(PictureFiles, WhatIsNoPictureLeavesAnEmptyImage)
 {
     const CTempFolder folder;
     Halves()->Save(folder.Path("a.png"), 90);
-    Halves()->Save(folder.Path("a.tga"), 90);
     const std::string png = ReadBytes(folder.Path("a.png"));
     WriteBytes(folder.Path("empty.png"), "");
     WriteBytes(folder.Path("text.png"), "no picture at all");
@@ -104,38 +94,6 @@ TEST(PictureFiles, WhatIsNoPictureLeavesAnEmptyImage)
     EXPECT_FALSE(Halves(2)->Save(folder.Path("a.png"), 90)) << "a format that has no colours that are known";
     EXPECT_FALSE(Ref<CImage>(new CImage)->Save(folder.Path("a.png"), 90));
     EXPECT_EQ(ReadBytes(folder.Path("a.png")), png) << "a failed write leaves the old file";
-}
-
-// Every prefix of a picture is read as far as possible or refused.
-TEST(PictureFiles, CutPicturesDoNoHarm)
-{
-    const CTempFolder folder;
-    for (const char* name : {"a.jpg", "a.png", "a.gif", "a.bmp", "a.tif", "a.pcx"})
-    {
-        Halves()->Save(folder.Path(name), 90);
-        const std::string whole = ReadBytes(folder.Path(name));
-        for (size_t size = 0; size < whole.size(); size += 7)
-        {
-            WriteBytes(folder.Path(name), std::string_view(whole).substr(0, size));
-            const Ref<CImage> image = new CImage;
-            const bool loaded = image->Load(folder.Path(name));
-            ASSERT_EQ(loaded, !image->Pixels().IsEmpty()) << name << ' ' << size;
-        }
-    }
-}
-
-TEST(CImage, PlainPixelsAreWrittenAsTheFormatSays)
-{
-    const Ref<CImage> image = PlainImage("p", 5, EPixelStorage::TempStore);
-    COrrinStream stream;
-    stream.AddRoot(image.Get());
-    CSceneBytes bytes = Scene().Root().Object("CImage", 1, "p").Text("").Add<uint16_t>(1).Byte(0);
-    bytes.Words({3, 2, 5}).Add<uint16_t>(1).Words({72, 300, 1}).Raw("\1\2\3\4\5\6\7\x08");
-    EXPECT_EQ(SaveBytes(stream), bytes.Bytes());
-    COrrinStream again;
-    ASSERT_TRUE(LoadBytes(again, bytes.Bytes()));
-    EXPECT_EQ(SaveBytes(again), bytes.Bytes());
-    EXPECT_GE(static_cast<CImage&>(*again.GetRoot(0)).Pixels().GetHandle(), 65'537u);
 }
 
 TEST(CImage, OddPixelsOfAFileAreReadOrRefused)
@@ -220,22 +178,13 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
     const Ref<CAnmImage> film = new CAnmImage;
     ASSERT_TRUE(film->Load(folder.Path("film.gif")));
     ASSERT_EQ(film->GetFrameCount(), 2u);
-    const struct
-    {
-        int32_t left, size;
-        uint32_t delay;
-        uint8_t green;
-    } rows[] = {
-        {0, 2, 70, 0},
-        {1, 1, 5, 255},
-    };
+    const std::tuple<int32_t, int32_t, uint32_t, int> frames[] = {{0, 2, 70, 0}, {1, 1, 5, 255}};
     for (size_t i = 0; i < 2; ++i)
     {
         const FilmFrame& frame = film->GetFrame(i);
-        EXPECT_EQ(frame.m_iLeft, rows[i].left);
-        EXPECT_EQ(frame.m_uiDelay, rows[i].delay);
-        EXPECT_EQ(frame.m_spkImage->Pixels().GetWidth(), rows[i].size);
-        EXPECT_EQ(CPixelView(frame.m_spkImage->Pixels()).Row(0)[1], rows[i].green);
+        const CPixelBuffer& pixels = frame.m_spkImage->Pixels();
+        const int green = CPixelView(pixels).Row(0)[1];
+        EXPECT_EQ(std::tuple(frame.m_iLeft, pixels.GetWidth(), frame.m_uiDelay, green), frames[i]);
     }
     const Ref<CImage> first = new CImage;
     ASSERT_TRUE(first->Load(folder.Path("film.gif"))) << "as a picture it is its first frame";
@@ -244,54 +193,36 @@ TEST(CAnmImage, ReadsEveryFrameOfAFilmWithPlaceAndDelay)
     EXPECT_EQ(film->GetFrameCount(), 0u);
 }
 
-namespace {
-
-// Returns a picture of one pixel.
-Ref<CImage> Dot(uint8_t shade)
-{
-    Ref<CImage> image = new CImage;
-    const uint8_t color[4] = {shade, shade, shade, 255};
-    image->Pixels().Create(1, 1, 0, color);
-    return image;
-}
-
-} // namespace
-
 TEST(CAnmImageControl, DrawsTheFrameOfItsTimeAtItsPlace)
 {
+    const auto dot = [](uint8_t shade) {
+        Ref<CImage> image = new CImage;
+        const uint8_t color[4] = {shade, shade, shade, 255};
+        image->Pixels().Create(1, 1, 0, color);
+        return image;
+    };
     const Ref<CAnmImage> film = new CAnmImage;
-    film->AddFrame({0, 50, 0, 0, {}, Dot(10).Get()});
-    film->AddFrame({0, 7, 1, 0, {}, Dot(20).Get()}); // starts after its own delay: at 70
+    film->AddFrame({0, 50, 0, 0, {}, dot(10).Get()});
+    film->AddFrame({0, 7, 1, 0, {}, dot(20).Get()}); // starts after its own delay: at 70
     film->AddFrame({0, 2, 2, 0, {}, nullptr});       // at 90, and shows nothing
     const Ref<CImage> screen = new CImage;
-    const uint8_t black[4] = {0, 0, 0, 255};
-    screen->Pixels().Create(3, 1, 0, black);
+    screen->Pixels().Create(3, 1, 0);
     const Ref<CAnmImageControl> control = new CAnmImageControl;
     control->m_fEndTime = 1000.0f;
     ASSERT_TRUE(screen->AttachControl(control.Get()));
     EXPECT_FALSE(control->Update(0.0f)) << "without a film";
     control->SetFilm(film.Get());
-    const struct
-    {
-        const char* what;
-        float time;
-        std::array<uint8_t, 3> shades;
-    } rows[] = {
-        {"before the second frame", 69.0f, {10, 0, 0}},
-        {"with it", 70.0f, {0, 20, 0}},
-        {"with the empty one", 500.0f, {0, 0, 0}},
-        {"back again", 1.0f, {10, 0, 0}},
-    };
     uint32_t stamp = screen->m_uiChangeStamp;
-    for (const auto& row : rows)
+    for (const auto& [time, left, right] :
+         {std::tuple{69.0f, 10, 0}, {70.0f, 0, 20}, {500.0f, 0, 0}, {1.0f, 10, 0}})
     {
-        SCOPED_TRACE(row.what);
-        screen->Pixels().Create(3, 1, 0, black);
-        EXPECT_TRUE(control->Update(row.time));
+        SCOPED_TRACE(time);
+        screen->Pixels().Create(3, 1, 0);
+        EXPECT_TRUE(control->Update(time));
         EXPECT_EQ(screen->m_uiChangeStamp, ++stamp);
         const CPixelView view(screen->Pixels());
-        for (size_t x = 0; x < 3; ++x)
-            EXPECT_EQ(view.Row(0)[4 * x], row.shades[x]);
+        EXPECT_EQ(view.Row(0)[0], left);
+        EXPECT_EQ(view.Row(0)[4], right);
     }
     control->m_bActive = false;
     EXPECT_FALSE(control->Update(70.0f));

@@ -42,31 +42,12 @@ inline Ref<CTextureMap> MapOf(CImage* image)
     return map;
 }
 
-inline Ref<CStandardMaterial> FullMaterial()
-{
-    Ref<CStandardMaterial> material = new CStandardMaterial;
-    material->m_bTwoSided = true;
-    float value = 0.0f;
-    for (Vec3* color :
-         {&material->m_kAmbient, &material->m_kDiffuse, &material->m_kSpecular, &material->m_kFilter})
-    {
-        *color = {value + 1, value + 2, value + 3};
-        value += 3;
-    }
-    for (float* number :
-         {&material->m_fShininess, &material->m_fShineStrength, &material->m_fSelfIllum,
-          &material->m_fOpacity, &material->m_fOpfall, &material->m_fWireSize, &material->m_fIORefract,
-          &material->m_fDimIntens, &material->m_fDimMult, &material->m_fSoftThresh})
-        *number = ++value;
-    return material;
-}
-
-/// Returns a graph with each kind of material and texture, no default values, shared images in both kinds of
+/// Returns a graph with each kind of material and texture, shared images in both kinds of
 /// storage, and a material blended with itself.
 inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::TempStore)
 {
     const Ref<CImage> wood = PlainImage("wood");
-    const Ref<CStandardMaterial> material = FullMaterial();
+    const Ref<CStandardMaterial> material = new CStandardMaterial;
     const Ref<CNormalBumpTex> bump = new CNormalBumpTex;
     bump->m_bUseFirstMap = false;
     bump->m_fSecondAmount = 2.0f;
@@ -77,7 +58,7 @@ inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::
 
     const Ref<CBlendMaterial> blend = new CBlendMaterial;
     blend->m_fBlend = 0.5f;
-    blend->m_aspkMtl[0] = FullMaterial().Get();
+    blend->m_aspkMtl[0] = new CStandardMaterial;
     blend->m_aspkMtl[1] = blend->m_aspkMtl[0].Get();
     Ref<CMultiMaterial> multi = new CMultiMaterial;
     multi->SetSubMaterialCount(3);
@@ -86,25 +67,18 @@ inline Ref<CObject> SampleMaterial(EPixelStorage bricksStorage = EPixelStorage::
     return multi.Get();
 }
 
-/// Draws a picture of 16 x 8 pixels, blue on the left and orange on the right, which JPEG preserves well.
-inline void DrawHalves(CPixelBuffer& pixels, int32_t format = 0)
+/// Returns a picture of 16 x 8 pixels, blue on the left and orange on the right, which JPEG preserves well.
+inline Ref<CImage> Halves(int32_t format = 0)
 {
     const uint8_t blue[4] = {250, 20, 10, 255};
     const uint8_t orange[4] = {10, 120, 240, 255};
-    pixels.Create(16, 8, format, blue);
-    const CPixelLock lock(pixels);
-    for (int32_t y = 0; y < 8; ++y)
-    {
-        for (int32_t x = 8; x < 16; ++x)
-            std::memcpy(lock.Row(y) + x * pixels.GetBytesPerPixel(), orange,
-                        size_t(pixels.GetBytesPerPixel()));
-    }
-}
-
-inline Ref<CImage> Halves(int32_t format = 0)
-{
     Ref<CImage> image = new CImage;
-    DrawHalves(image->Pixels(), format);
+    CPixelBuffer& pixels = image->Pixels();
+    pixels.Create(16, 8, format, blue);
+    const auto bytes = static_cast<size_t>(pixels.GetBytesPerPixel());
+    const CPixelLock lock(pixels);
+    for (int32_t i = 0; i < 64; ++i)
+        std::memcpy(lock.Row(i / 8) + (8 + i % 8) * pixels.GetBytesPerPixel(), orange, bytes);
     return image;
 }
 

@@ -25,6 +25,16 @@ using testing::ElementsAre;
 
 class EveryStorage : public testing::TestWithParam<EPixelStorage>
 {
+protected:
+    bool IsForeign() const { return GetParam() == EPixelStorage::Foreign; }
+    // Gives a buffer the storage; a foreign block holds 3 x 2 pixels of 3 bytes in aligned rows.
+    void Prepare(CPixelBuffer& buffer)
+    {
+        buffer.SetRowAlignment(true);
+        EXPECT_TRUE(IsForeign() ? buffer.Attach(m_aBlock.data(), 3, 2, 1) : buffer.SetStorage(GetParam()));
+    }
+
+    std::array<uint8_t, 25> m_aBlock{};
 };
 
 } // namespace
@@ -57,14 +67,9 @@ TEST_P(EveryStorage, CreateFillsClearsAndRefusesAsStated)
 {
     CPixelBuffer other; // keeps the temporary file, so that blocks are reused
     ASSERT_TRUE(other.SetStorage(EPixelStorage::TempStore) && other.Create(1, 1, 0));
-    std::array<uint8_t, 64> block;
-    block.fill(9);
+    m_aBlock.fill(9);
     CPixelBuffer buffer;
-    buffer.SetRowAlignment(true);
-    if (GetParam() == EPixelStorage::Foreign)
-        EXPECT_TRUE(buffer.Attach(block.data(), 3, 2, 1));
-    else
-        EXPECT_TRUE(buffer.SetStorage(GetParam()));
+    Prepare(buffer);
     ASSERT_TRUE(buffer.Create(3, 2, 1, kPixel));
     EXPECT_THAT(BytesOf(buffer),
                 ElementsAre(1, 2, 3, 1, 2, 3, 1, 2, 3, 0, 0, 0, 1, 2, 3, 1, 2, 3, 1, 2, 3, 0, 0, 0));
@@ -73,15 +78,12 @@ TEST_P(EveryStorage, CreateFillsClearsAndRefusesAsStated)
     EXPECT_EQ(BytesOf(buffer)[4], 2);
     ASSERT_TRUE(buffer.Create(3, 2, 1));
     EXPECT_EQ(BytesOf(buffer), std::vector<int>(24));
-    EXPECT_EQ(buffer.Create(2, 2, 0, kPixel), GetParam() != EPixelStorage::Foreign);
-    if (GetParam() != EPixelStorage::Foreign)
-    {
-        EXPECT_THAT(BytesOf(buffer), ElementsAre(1, 2, 3, 4, 1, 2, 3, 4, 1, 2, 3, 4, 1, 2, 3, 4));
-    }
+    EXPECT_EQ(buffer.Create(1, 2, 0, kPixel), !IsForeign());
+    EXPECT_EQ(BytesOf(buffer), IsForeign() ? std::vector<int>(24) : (std::vector{1, 2, 3, 4, 1, 2, 3, 4}));
     EXPECT_TRUE(buffer.Free());
     EXPECT_TRUE(buffer.IsEmpty());
     EXPECT_EQ(buffer.GetHandle(), 0u);
-    EXPECT_EQ(block[24], 9) << "what belongs to others stays whole";
+    EXPECT_EQ(m_aBlock[24], 9) << "what belongs to others stays whole";
 }
 
 TEST_P(EveryStorage, CopiesTakeEverythingButWhereItIsKept)
@@ -92,13 +94,8 @@ TEST_P(EveryStorage, CopiesTakeEverythingButWhereItIsKept)
     source.SetResolution(72, 300);
     source.Create(3, 2, 1, kPixel);
     CPixelLock(source).Row(1)[4] = 99;
-    std::array<uint8_t, 24> block{};
     CPixelBuffer copy;
-    copy.SetRowAlignment(true);
-    if (GetParam() == EPixelStorage::Foreign)
-        copy.Attach(block.data(), 3, 2, 1);
-    else
-        copy.SetStorage(GetParam());
+    Prepare(copy);
     ASSERT_TRUE(copy.Copy(source));
     EXPECT_EQ(BytesOf(copy), BytesOf(source));
     EXPECT_EQ(BytesOf(copy)[16], 99);
@@ -106,7 +103,7 @@ TEST_P(EveryStorage, CopiesTakeEverythingButWhereItIsKept)
     EXPECT_EQ(copy.Layout().m_iVerticalResolution, 300);
     EXPECT_FALSE(copy.Copy(CPixelBuffer())) << "of nothing there is no copy";
     source.Create(4, 2, 1);
-    EXPECT_EQ(copy.Copy(source), GetParam() != EPixelStorage::Foreign);
+    EXPECT_EQ(copy.Copy(source), !IsForeign());
     const CPixelBuffer made(copy);
     EXPECT_EQ(BytesOf(made), BytesOf(copy));
     EXPECT_NE(made.GetStorage(), EPixelStorage::Foreign) << "a copy owns its pixels";
@@ -114,13 +111,9 @@ TEST_P(EveryStorage, CopiesTakeEverythingButWhereItIsKept)
 
 TEST_P(EveryStorage, WhatIsLockedStaysWhereItIs)
 {
-    std::array<uint8_t, 24> block{};
     CPixelBuffer buffer;
     EXPECT_FALSE(CPixelLock(buffer));
-    if (GetParam() == EPixelStorage::Foreign)
-        buffer.Attach(block.data(), 3, 2, 1);
-    else
-        buffer.SetStorage(GetParam());
+    Prepare(buffer);
     buffer.Create(3, 2, 1);
     const uint32_t revision = buffer.GetRevision();
     {
@@ -131,7 +124,7 @@ TEST_P(EveryStorage, WhatIsLockedStaysWhereItIs)
         EXPECT_EQ(buffer.GetRevision(), revision) << "looking changes nothing";
         EXPECT_FALSE(buffer.Free());
         EXPECT_FALSE(buffer.Create(4, 4, 0));
-        EXPECT_FALSE(buffer.Attach(block.data(), 1, 1, 5));
+        EXPECT_FALSE(buffer.Attach(m_aBlock.data(), 1, 1, 5));
         EXPECT_TRUE(buffer.Create(3, 2, 1, kPixel)) << "the same size keeps its block";
         EXPECT_EQ(view.Row(1)[3], 1);
     }
@@ -147,38 +140,28 @@ TEST(Blit, MixesByOpacityInAllPairings)
 {
     const uint8_t to[4] = {100, 100, 100, 100};
     const uint8_t from[4] = {0, 200, 255, 20};
-    const struct
-    {
-        int32_t to, from;
-        uint8_t opacity;
-        std::vector<int> pixel;
-    } rows[] = {
+    const std::tuple<int32_t, int32_t, uint8_t, std::vector<int>> rows[] = {
         {0, 0, 255, {0, 200, 255, 20}},  {0, 0, 51, {80, 120, 131, 84}}, {0, 1, 255, {0, 200, 255, 255}},
         {0, 1, 51, {80, 120, 131, 131}}, {1, 0, 255, {0, 200, 255}},     {1, 0, 51, {80, 120, 131}},
         {1, 1, 255, {0, 200, 255}},      {1, 1, 128, {50, 150, 178}},    {0, 0, 0, {100, 100, 100, 100}},
     };
-    for (const auto& row : rows)
+    for (const auto& [toFormat, fromFormat, opacity, pixel] : rows)
     {
-        SCOPED_TRACE(testing::Message() << row.from << " on " << row.to << " by " << int(row.opacity));
+        SCOPED_TRACE(testing::Message() << fromFormat << " on " << toFormat << " by " << int(opacity));
         CPixelBuffer destination;
         CPixelBuffer source;
         destination.SetStorage(EPixelStorage::TempStore);
-        destination.Create(1, 1, row.to, to);
-        source.Create(1, 1, row.from, from);
-        EXPECT_TRUE(Blit(destination, 0, 0, source, 0, 0, 1, 1, row.opacity));
-        EXPECT_EQ(BytesOf(destination), row.pixel);
+        destination.Create(1, 1, toFormat, to);
+        source.Create(1, 1, fromFormat, from);
+        EXPECT_TRUE(Blit(destination, 0, 0, source, 0, 0, 1, 1, opacity));
+        EXPECT_EQ(BytesOf(destination), pixel);
     }
 }
 
 TEST(Blit, IsCutToBothPictures)
 {
     // A source of 3 x 3 pixels numbered from 1, on a destination of 4 x 3 zeros.
-    const struct
-    {
-        const char* what;
-        int32_t x, y, sourceX, sourceY, width, height;
-        std::vector<int> blues;
-    } rows[] = {
+    const std::tuple<const char*, int, int, int, int, int, int, std::vector<int>> rows[] = {
         {"inside", 1, 1, 0, 0, 2, 2, {0, 0, 0, 0, 0, 1, 2, 0, 0, 4, 5, 0}},
         {"left and above", -1, -2, 0, 0, 3, 3, {8, 9, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0}},
         {"right and below", 3, 2, 0, 0, 3, 3, {0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 0, 1}},
@@ -193,17 +176,15 @@ TEST(Blit, IsCutToBothPictures)
     source.Create(3, 3, 1);
     for (int32_t i = 0; i < 9; ++i)
         CPixelLock(source).Row(i / 3)[i % 3 * 3] = static_cast<uint8_t>(i + 1);
-    for (const auto& row : rows)
+    for (const auto& [what, x, y, sourceX, sourceY, width, height, wanted] : rows)
     {
-        SCOPED_TRACE(row.what);
         CPixelBuffer destination;
         destination.Create(4, 3, 0);
-        EXPECT_TRUE(
-            Blit(destination, row.x, row.y, source, row.sourceX, row.sourceY, row.width, row.height, 255));
+        EXPECT_TRUE(Blit(destination, x, y, source, sourceX, sourceY, width, height, 255));
         std::vector<int> blues;
         for (int32_t i = 0; i < 12; ++i)
             blues.push_back(CPixelView(destination).Row(i / 4)[i % 4 * 4]);
-        EXPECT_EQ(blues, row.blues);
+        EXPECT_EQ(blues, wanted) << what;
     }
 }
 
@@ -219,17 +200,17 @@ TEST(Blit, OverlappingPartsOfOnePictureAreTakenAsTheyWere)
 
 TEST(Blit, RefusesOtherFormatsAndEmptyPictures)
 {
+    CPixelBuffer known;
+    known.Create(2, 2, 0);
+    EXPECT_FALSE(Blit(known, 0, 0, CPixelBuffer(), 0, 0, 2, 2, 255));
     for (int32_t format = 2; format < 6; ++format)
     {
-        CPixelBuffer known;
         CPixelBuffer other;
-        known.Create(2, 2, 0);
         other.Create(2, 2, format, kPixel);
         EXPECT_FALSE(Blit(known, 0, 0, other, 0, 0, 2, 2, 255)) << format;
         EXPECT_FALSE(Blit(other, 0, 0, known, 0, 0, 2, 2, 255)) << format;
-        EXPECT_EQ(BytesOf(known), std::vector<int>(16));
-        EXPECT_FALSE(Blit(known, 0, 0, CPixelBuffer(), 0, 0, 2, 2, 255));
     }
+    EXPECT_EQ(BytesOf(known), std::vector<int>(16));
 }
 
 } // namespace gw

@@ -8,7 +8,6 @@
 
 #include <csignal>
 #include <cstring>
-#include <thread>
 
 #include <sys/resource.h>
 #include <sys/stat.h>
@@ -176,37 +175,6 @@ TEST_F(TempStore, AFullDiskIsAnAnswer)
     EXPECT_EQ(nowhere.Allocate(1), 0u);
 }
 
-TEST_F(TempStore, ViewsMayBeTakenInSeveralThreads)
-{
-    const uint32_t handle = m_kStore.Allocate(kPage);
-    const auto count = [&] {
-        for (int i = 0; i < 2000; ++i)
-        {
-            ASSERT_NE(m_kStore.Map(handle), nullptr);
-            m_kStore.Unmap(handle);
-        }
-    };
-    std::thread other(count);
-    count();
-    other.join();
-    std::byte* const bytes = m_kStore.Map(handle);
-    bytes[kPage - 1] = std::byte{1};
-    m_kStore.Unmap(handle);
-}
-
-TEST_F(TempStore, APurgeTakesWhatACrashLeft)
-{
-    CreateFolder(m_kFolder.Path("old"));
-    WriteBytes(m_kFolder.Path("old/TK_1.tmp"), "x");
-    WriteBytes(m_kFolder.Path("old/keep.txt"), "x");
-    CTempStore::Purge(m_kFolder.Path("old"));
-    EXPECT_FALSE(FileExists(m_kFolder.Path("old/TK_1.tmp")));
-    EXPECT_TRUE(FileExists(m_kFolder.Path("old/keep.txt")));
-    DeleteFile(m_kFolder.Path("old/keep.txt"));
-    CTempStore::Purge(m_kFolder.Path("old"));
-    EXPECT_FALSE(FolderExists(m_kFolder.Path("old")));
-}
-
 // Anybody can create a link in the folder for temporary files.
 TEST_F(TempStore, ALinkToAFolderOfSomebodyIsLeftAlone)
 {
@@ -219,19 +187,31 @@ TEST_F(TempStore, ALinkToAFolderOfSomebodyIsLeftAlone)
     EXPECT_TRUE(FileExists(m_kFolder.Path("home/mine.tmp")));
 }
 
-TEST_F(TempStore, TheFirstFileTakesAwayWhatACrashLeftAndHarmsNobodyAlive)
+TEST_F(TempStore, WhatACrashLeftIsTakenAwayAndNobodyAliveHarmed)
 {
+    const std::string folder = m_kStore.GetFolder();
     const uint32_t handle = m_kStore.Allocate(1);
-    CreateFolder(m_kStore.GetFolder());
-    WriteBytes(m_kStore.GetFolder() + "TK_old.tmp", "x");
-    CTempStore other(m_kStore.GetFolder());
+    WriteBytes(folder + "TK_old.tmp", "x");
+    CTempStore other(folder);
     const uint32_t theirs = other.Allocate(1);
-    EXPECT_FALSE(FileExists(m_kStore.GetFolder() + "TK_old.tmp"));
+    EXPECT_FALSE(FileExists(folder + "TK_old.tmp")) << "by the first file";
     EXPECT_EQ(FileCount(), 1u);
     other.Free(theirs);
     std::byte* const bytes = m_kStore.Map(handle);
     ASSERT_NE(bytes, nullptr);
     bytes[kPage - 1] = std::byte{1};
+
+    m_kStore.Unmap(handle);
+    m_kStore.Free(handle);
+    CreateFolder(folder);
+    WriteBytes(folder + "TK_1.tmp", "x");
+    WriteBytes(folder + "keep.txt", "x");
+    CTempStore::Purge(folder);
+    EXPECT_FALSE(FileExists(folder + "TK_1.tmp"));
+    EXPECT_TRUE(FileExists(folder + "keep.txt"));
+    DeleteFile(folder + "keep.txt");
+    CTempStore::Purge(folder);
+    EXPECT_FALSE(FolderExists(folder));
 }
 
 } // namespace gw

@@ -19,12 +19,25 @@ constexpr MadeBone kBones[] = {
     {"RKnee", "RHip", {0.0f, -kUpper, 0.0f}},  {"RAnkle", "RKnee", {0.0f, -kLower, 0.0f}},
     {"RBall", "RAnkle", {0.0f, -6.0f, 14.0f}},
 };
-constexpr MadeBone kTargetLegs[] = {
-    {"LowerTorso", "", {0.0f, 923.0f, 13.0f}},     {"LPelvis", "LowerTorso", kVec3Zero, 180.0},
-    {"LThigh", "LPelvis", {-95.0f, 138.0f, 0.0f}}, {"LCalf", "LThigh", {0.0f, 360.0f, 0.0f}},
-    {"LFoot", "LCalf", {0.0f, 345.0f, 0.0f}},      {"LToe", "LFoot", {0.0f, 62.0f, 130.0f}},
-    {"RPelvis", "LowerTorso", kVec3Zero, 180.0},   {"RThigh", "RPelvis", {95.0f, 138.0f, 0.0f}},
-    {"RCalf", "RThigh", {0.0f, 360.0f, 0.0f}},     {"RFoot", "RCalf", {0.0f, 345.0f, 0.0f}},
+constexpr MadeBone kTarget[] = {
+    {"LowerTorso", "", kTargetOrigin},
+    {"Waist", "LowerTorso", {0.0f, 95.0f, 0.0f}},
+    {"UpperTorso", "Waist", {0.0f, 150.0f, 0.0f}},
+    {"Neck", "UpperTorso", {0.0f, 265.0f, 0.0f}},
+    {"Head", "Neck", {0.0f, 95.0f, 0.0f}},
+    {"LCollar", "UpperTorso", {25.0f, 215.0f, 0.0f}, -90.0},
+    {"LUpperArm", "LCollar", {0.0f, 145.0f, 0.0f}},
+    {"LForearm", "LUpperArm", {0.0f, 285.0f, 0.0f}},
+    {"LHand", "LForearm", {0.0f, 255.0f, 0.0f}},
+    {"LPelvis", "LowerTorso", kVec3Zero, 180.0},
+    {"LThigh", "LPelvis", {-95.0f, 138.0f, 0.0f}},
+    {"LCalf", "LThigh", {0.0f, 360.0f, 0.0f}},
+    {"LFoot", "LCalf", {0.0f, 345.0f, 0.0f}},
+    {"LToe", "LFoot", {0.0f, 62.0f, 130.0f}},
+    {"RPelvis", "LowerTorso", kVec3Zero, 180.0},
+    {"RThigh", "RPelvis", {95.0f, 138.0f, 0.0f}},
+    {"RCalf", "RThigh", {0.0f, 360.0f, 0.0f}},
+    {"RFoot", "RCalf", {0.0f, 345.0f, 0.0f}},
     {"RToe", "RFoot", {0.0f, 62.0f, 130.0f}},
 };
 
@@ -114,9 +127,9 @@ bool WalkerStands(int side, int frame)
     return phase > 0.1 && phase < 0.5;
 }
 
-Ref<CNode> MakeTargetLegs()
+Ref<CNode> MakeTarget()
 {
-    return &CMadeFigure(kTargetLegs).Root();
+    return &CMadeFigure(kTarget).Root();
 }
 
 void PairWalker(CRetargeter& retargeter, const CWalker& walker, CNode& target)

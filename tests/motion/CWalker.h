@@ -9,7 +9,8 @@
 
 namespace gw {
 
-inline constexpr float kWalkerSeconds = 1.0f / 30.0f; ///< from frame to frame
+inline constexpr Vec3 kTargetOrigin{0.0f, 923.0f, 13.0f}; ///< of its root, at rest
+inline constexpr float kWalkerSeconds = 1.0f / 30.0f;     ///< from frame to frame
 
 /// A body in centimetres that is posed by where its hips and ankles are, so that a test knows which feet
 /// stand and what its knees do. Its legs are 45 + 37 long; a flat foot's ankle is 8 above the floor.
@@ -39,8 +40,9 @@ CWalker::Pose WalkingPose(int frame);
 /// Whether the left (0) or right foot lies flat and still in a frame of that walk.
 bool WalkerStands(int side, int frame);
 
-/// The legs of a target of the fixed skeleton's make, at rest with its soles on y = 0.
-Ref<CNode> MakeTargetLegs();
+/// A target of the fixed skeleton's make without a right arm: legs below pelvis bones that are turned by half
+/// a turn, 360 + 345 long, soles on y = 0 at rest.
+Ref<CNode> MakeTarget();
 /// Pairs a walker with such a target, with the offsets that match their rest poses.
 void PairWalker(CRetargeter& retargeter, const CWalker& walker, CNode& target);
 

@@ -2,18 +2,20 @@
 
 #include "Angles.h"
 #include "CKeyframeControl.h"
+#include "CLegTrack.h"
 #include "CWalker.h"
+#include "Directions.h"
 #include "Rotations.h"
 #include "Skeleton.h"
 
 #include <algorithm>
 #include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
 
-constexpr Vec3 kOrigin{0.0f, 923.0f, 13.0f};
 constexpr float kScale = 705.0f / 82.0f;
 constexpr const char* kSides[] = {"L", "R"};
 
@@ -22,7 +24,7 @@ class Faithful : public ::testing::Test
 protected:
     void SetUp() override
     {
-        m_kTarget = MakeTargetLegs();
+        m_kTarget = MakeTarget();
         PairWalker(m_kRetargeter, m_kWalker, *m_kTarget);
         m_kRetargeter.SetFaithful(true);
     }
@@ -33,8 +35,8 @@ protected:
     }
     void Run(int frameCount, bool useLegs = true)
     {
-        m_kRetargeter.Retarget(0.0f, static_cast<float>(frameCount - 1), 0.0f, kWalkerSeconds, kOrigin, true,
-                               useLegs);
+        m_kRetargeter.Retarget(0.0f, static_cast<float>(frameCount - 1), 0.0f, kWalkerSeconds, kTargetOrigin,
+                               true, useLegs);
     }
     void PoseAt(int frame)
     {
@@ -45,27 +47,17 @@ protected:
     CNode& Target(const std::string& name) { return *FindNode(m_kTarget.Get(), name.c_str()); }
     Vec3 Place(const std::string& name) { return Target(name).m_kWorldMatrix.Translation(); }
     Vec3 Source(const std::string& name) { return m_kWalker.Bone(name).m_kWorldMatrix.Translation(); }
-    // Between a bone of the target and what drives it, by their joints.
-    double LegError(const std::string& from, const std::string& to, const std::string& sourceFrom,
-                    const std::string& sourceTo)
+    Vec3 Along(const std::string& from, const std::string& to) { return Place(to) - Place(from); }
+    // Expects a leg's bones to point as the source's, to within these degrees.
+    void ExpectLeg(const std::string& side, double thigh, double calf)
     {
-        const Vec3 a = Place(to) - Place(from);
-        const Vec3 b = Source(sourceTo) - Source(sourceFrom);
-        return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;
-    }
-    double ThighError(const std::string& side)
-    {
-        return LegError(side + "Thigh", side + "Calf", side + "Hip", side + "Knee");
-    }
-    double CalfError(const std::string& side)
-    {
-        return LegError(side + "Calf", side + "Foot", side + "Knee", side + "Ankle");
+        const Vec3 knee = Source(side + "Knee");
+        EXPECT_LT(AngleBetween(Along(side + "Thigh", side + "Calf"), knee - Source(side + "Hip")), thigh);
+        EXPECT_LT(AngleBetween(Along(side + "Calf", side + "Foot"), Source(side + "Ankle") - knee), calf);
     }
     double KneeAngle(const std::string& side)
     {
-        const Vec3 a = Place(side + "Calf") - Place(side + "Thigh");
-        const Vec3 b = Place(side + "Foot") - Place(side + "Calf");
-        return std::atan2(Vec3Length(Vec3Cross(a, b)), Vec3Dot(a, b)) * kRadiansToDegrees64;
+        return AngleBetween(Along(side + "Thigh", side + "Calf"), Along(side + "Calf", side + "Foot"));
     }
     std::vector<Quat> Rotations(const std::string& name)
     {
@@ -89,8 +81,7 @@ TEST_F(Faithful, FeetOfAWalkStandStillOnTheFloorAndLegsPointAsTheSources)
         {
             SCOPED_TRACE(name + " frame " + std::to_string(frame));
             PoseAt(frame);
-            EXPECT_LT(ThighError(name), 2.5);
-            EXPECT_LT(CalfError(name), 2.5);
+            ExpectLeg(name, 2.5, 2.5);
             EXPECT_GT(std::min(Place(name + "Foot").y - 80.0f, Place(name + "Toe").y - 18.0f), -50.0f);
             if (!WalkerStands(side, frame))
                 continue;
@@ -114,8 +105,8 @@ TEST_F(Faithful, RootGoesAsFarAndHipsAreAsHighAsTheSourcesInLegLengths)
     };
     Convert(61, crouching, false);
     PoseAt(0);
-    EXPECT_NEAR(Place("LowerTorso").x, kOrigin.x, 1e-3f);
-    EXPECT_NEAR(Place("LowerTorso").z, kOrigin.z, 1e-3f);
+    EXPECT_NEAR(Place("LowerTorso").x, kTargetOrigin.x, 1e-3f);
+    EXPECT_NEAR(Place("LowerTorso").z, kTargetOrigin.z, 1e-3f);
     const float start = (Place("LThigh") + Place("RThigh")).y * 0.5f;
     EXPECT_NEAR(start - 80.0f, 76.0f * kScale, 15.0f);
     for (int frame = 0; frame <= 60; frame += 10)
@@ -145,8 +136,7 @@ TEST_F(Faithful, KneesBendInTheSourcesPlaneAndFeetKeepTheirTurn)
         PoseAt(frame);
         for (const std::string side : kSides)
         {
-            EXPECT_LT(ThighError(side), 4.0);
-            EXPECT_LT(CalfError(side), 6.0);
+            ExpectLeg(side, 4.0, 6.0);
             const Mat3 turned = halfTurn * NormalizedRows(m_kWalker.Bone(side + "Ankle").m_kWorldMatrix);
             EXPECT_LT(DegreesBetween(NormalizedRows(Target(side + "Foot").m_kWorldMatrix), turned), 0.05);
         }
@@ -167,8 +157,7 @@ TEST_F(Faithful, StandingFeetOfABodyThatRisesStayOnTheFloorAndItsKneesAsTheyAre)
     {
         SCOPED_TRACE(frame);
         PoseAt(frame);
-        EXPECT_LT(ThighError("L"), 1.5);
-        EXPECT_LT(CalfError("L"), 1.5);
+        ExpectLeg("L", 1.5, 1.5);
         EXPECT_NEAR(Place("LFoot").y, 80.0f, 1.0f);
     }
 }
@@ -200,8 +189,7 @@ TEST_F(Faithful, WithoutHeldFeetLegsPointExactlyAsTheSources)
     for (int frame = 0; frame < 40; frame += 3)
     {
         PoseAt(frame);
-        EXPECT_LT(ThighError("L"), 0.05) << frame;
-        EXPECT_LT(CalfError("L"), 0.05) << frame;
+        ExpectLeg("L", 0.05, 0.05);
     }
 }
 
@@ -211,51 +199,44 @@ TEST_F(Faithful, LegThatIsNotMappedToItsFootIsLeftToTheRules)
     Convert(40, WalkingPose);
     const std::vector<Quat> thigh = Rotations("RThigh");
     const std::vector<Quat> left = Rotations("LThigh");
-    m_kTarget = MakeTargetLegs();
+    m_kTarget = MakeTarget();
     CRetargeter plain;
     PairWalker(plain, m_kWalker, *m_kTarget);
     plain.SetSourceOf(&Target("RFoot"), nullptr);
-    plain.Retarget(0.0f, 39.0f, 0.0f, kWalkerSeconds, kOrigin, true, true);
+    plain.Retarget(0.0f, 39.0f, 0.0f, kWalkerSeconds, kTargetOrigin, true, true);
     EXPECT_EQ(thigh, Rotations("RThigh"));
     EXPECT_NE(left, Rotations("LThigh"));
 }
 
 TEST_F(Faithful, OddSourcesGiveFiniteKeys)
 {
-    const struct
-    {
-        const char* what;
-        int frameCount;
-        float drop;  // of the left ankle below its hip
-        float place; // of all joints, in x
-        float jump;  // of the root in the last frame, in z
-    } rows[] = {
+    // drop: of the left ankle below its hip; place: of all joints, in x; jump: of the root in the last frame,
+    // in z
+    const std::tuple<const char*, int, float, float, float> rows[] = {
         {"one frame", 1, 76.0f, 0.0f, 0.0f},
         {"an ankle at its hip", 20, 2.5f, 0.0f, 0.0f},
         {"far away", 20, 76.0f, 1e7f, 0.0f},
         {"at the end of the numbers", 20, 76.0f, 0.0f, 3.4e38f},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, frameCount, drop, place, jump] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         CWalker walker;
-        walker.Record(row.frameCount, [&](int frame) {
+        walker.Record(frameCount, [drop = drop, place = place](int frame) {
             CWalker::Pose pose = WalkingPose(frame);
-            pose.ankles[0] = pose.hips + Vec3{9.0f, -row.drop, 0.0f};
-            for (Vec3* place : {&pose.hips, &pose.ankles[0], &pose.ankles[1]})
-                place->x += row.place;
+            pose.ankles[0] = pose.hips + Vec3{9.0f, -drop, 0.0f};
+            for (Vec3* joint : {&pose.hips, &pose.ankles[0], &pose.ankles[1]})
+                joint->x += place;
             return pose;
         });
-        static_cast<CKeyframeControl*>(walker.Root().GetControl())->m_kPositionKeys.Expand().back().z +=
-            row.jump;
-        m_kTarget = MakeTargetLegs();
+        static_cast<CKeyframeControl*>(walker.Root().GetControl())->m_kPositionKeys.Expand().back().z += jump;
+        m_kTarget = MakeTarget();
         PairWalker(m_kRetargeter, walker, *m_kTarget);
-        Run(row.frameCount);
-        for (CNode* node : NodesOf(*m_kTarget))
+        Run(frameCount);
+        for (const CNode* node : NodesOf(*m_kTarget))
         {
-            const auto& track = *static_cast<CKeyframeControl*>(node->GetControl());
-            ASSERT_EQ(track.m_kRotationKeys.size(), static_cast<size_t>(row.frameCount));
-            for (const Quat& key : track.m_kRotationKeys)
+            ASSERT_EQ(Rotations(node->GetName()).size(), static_cast<size_t>(frameCount));
+            for (const Quat& key : Rotations(node->GetName()))
                 ASSERT_TRUE(std::isfinite(key.w + key.x + key.y + key.z)) << node->GetName();
         }
     }
@@ -271,6 +252,19 @@ TEST_F(Faithful, FeetOfASinglePoseStandOnTheFloor)
     PoseAt(0);
     EXPECT_NEAR(Place("LFoot").y, 80.0f, 1.0f);
     EXPECT_NEAR(Place("RFoot").y, 80.0f + 22.0f * kScale, 12.0f);
+}
+
+// The lower joint of a foot is 4 below the origin at rest, half a calf is 18.5 long.
+TEST(RestFloor, IsTheOriginsForABodyThatStandsAndElseItsOwn)
+{
+    const CWalker walker;
+    const std::vector<LegJoints> legs{
+        {&walker.Bone("LHip"), &walker.Bone("LKnee"), &walker.Bone("LAnkle"), &walker.Bone("LBall")}};
+    for (const auto& [raised, floor] : {std::pair{0.0f, -4.0}, {6.0f, 0.0}, {36.0f, 32.0}})
+    {
+        walker.Root().m_kMatrix.SetTranslation({0.0f, 88.0f + raised, 0.0f});
+        EXPECT_NEAR(RestFloor(legs), floor, 1e-4) << raised;
+    }
 }
 
 } // namespace

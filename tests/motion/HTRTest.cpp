@@ -19,22 +19,6 @@ namespace {
 
 constexpr double kTolerance = 1e-3; // degrees
 
-// The small file with one piece of text replaced. An empty `from` stands for the whole text.
-struct Change
-{
-    const char* what;
-    std::string from;
-    std::string to;
-};
-
-std::string Changed(const Change& change)
-{
-    std::string text(kSmallHTR);
-    const size_t at = text.find(change.from);
-    EXPECT_NE(at, text.npos) << change.from;
-    return change.from.empty() ? change.to : text.replace(at, change.from.size(), change.to);
-}
-
 std::string Chain(size_t depth)
 {
     std::string text = "[Header]\nNumSegments 100000\n[SegmentNames&Hierarchy]\nS0 GLOBAL\n";
@@ -85,67 +69,42 @@ TEST(TKHTRStream, ReadsTheSameMotionWhateverMeansNothing)
         {"unknown section", "[Torso]", "[EndOfFile]\n1 2 3\n[Torso]"},
         {"more segments than lines", "NumSegments 2", "NumSegments 99"},
         {"longer words than fit", "Order ZYX", "Order ZYXr"},
-        {"surplus row", "-5 15 25 1\n", "-5 15 25 1\n3 9 9 9 9 9 9 9\n"},
     };
-    CLoadedMotion plain(kSmallHTR, "a.htr");
-    const Mat4 expected = PosedNode(plain.motion, "Head", 1).m_kWorldMatrix;
-    for (const Change& row : rows)
-    {
-        SCOPED_TRACE(row.what);
-        CLoadedMotion file(Changed(row), "a.htr");
-        ASSERT_TRUE(file.loaded) << RecordText(file.motion.Record());
-        EXPECT_EQ(PosedNode(file.motion, "Head", 1).m_kWorldMatrix, expected);
-        EXPECT_EQ(file.motion.GetKeyCount(), 2);
-        EXPECT_EQ(RecordText(file.motion.Record()), "");
-    }
+    ExpectSame(kSmallHTR, "a.htr", rows);
 }
 
 TEST(TKHTRStream, ReadsOddFilesAsTheyStand)
 {
     const std::string noRows = "MissingSection 17 Head\n";
-    const char* const lostHead = "UnknownSegment 21 Head\nUnknownSegment 27 [Head]\n";
-    const std::tuple<Change, const char*, size_t, std::string> rows[] = {
-        {{"a segment not counted", "ments 2", "ments 1"}, "Torso", 0, "BadCount 17 NumSegments\n*"},
-        {{"unknown parent", "Head Torso", "Head Body"}, "Torso", 0, "UnknownSegment 17 Body\n*"},
-        {{"two roots", "Head Torso", "Head GLOBAL"}, "Torso", 0, ""},
-        {{"section without an end", "[Head]", "[Head"},
-         "Torso(Head)",
-         0,
-         "UnknownSegment 27 [Head\n" + noRows},
-        {{"a row is missing", "2 0 0 0 -5 15 25 1\n", ""}, "Torso(Head)", 1, "TooFewRows 17 Head\n"},
-        {{"a row is short", "-5 15 25 1", "-5"}, "Torso(Head)", 2, "ShortRow 30 Head\n"},
-        {{"a row without values", "2 0 0 0 -5 15 25 1", "2"}, "Torso(Head)", 2, "ShortRow 30 Head\n"},
-        {{"key without value", "Factor 1.000000", "Factor"},
-         "Torso(Head)",
-         2,
-         "MissingTokens 13 ScaleFactor\n"},
-        {{"used key without value", "mes 2", "mes"}, "Torso(Head)", 2, "MissingTokens 6 NumFrames\n"},
-        {{"two numbers in one", "2 0 0 0 -5", "2 0 0 0-5"}, "Torso(Head)", 2, "StuckNumber 30 0-5\n"},
-        {{"two sections", "[Head]", "[Head]\n1 2\n[Head]"}, "Torso(Head)", 3, "ShortRow 28 Head\n"},
-        {{"fewer frames than none", "Frames 2", "Frames -2"}, "Torso(Head)", 2, ""},
+    const std::string lostHead = "UnknownSegment 21 Head\nUnknownSegment 27 [Head]\n";
+    const Change rows[] = {
+        {"a segment not counted", "ments 2", "ments 1", "BadCount 17 NumSegments\n" + lostHead, 2, "Torso"},
+        {"unknown parent", "Head Torso", "Head Body", "UnknownSegment 17 Body\n" + lostHead, 2, "Torso"},
+        {"two roots", "Head Torso", "Head GLOBAL", "", 2, "Torso"},
+        {"section without an end", "[Head]", "[Head", "UnknownSegment 27 [Head\n" + noRows, 0},
+        {"a row is missing", "2 0 0 0 -5 15 25 1\n", "", "TooFewRows 17 Head\n", 1},
+        {"a row is short", "-5 15 25 1", "-5", "ShortRow 30 Head\n"},
+        {"a row without values", "2 0 0 0 -5 15 25 1", "2", "ShortRow 30 Head\n"},
+        {"key without value", "Factor 1.000000", "Factor", "MissingTokens 13 ScaleFactor\n"},
+        {"used key without value", "mes 2", "mes", "MissingTokens 6 NumFrames\n"},
+        {"two numbers in one", "2 0 0 0 -5", "2 0 0 0-5", "StuckNumber 30 0-5\n"},
+        {"two sections", "[Head]", "[Head]\n1 2\n[Head]", "ShortRow 28 Head\n", 3},
+        {"surplus row", "-5 15 25 1\n", "-5 15 25 1\n3 9 9 9 9 9 9 9\n", "", 3},
+        {"base pose before its segment", "[Header]", "[BasePosition]\nTorso 1 2 3 0 0 0 9\n[Header]",
+         "UnknownSegment 2 Torso\n"},
+        {"fewer frames than none", "Frames 2", "Frames -2"},
     };
-    for (const auto& [change, tree, headKeys, recorded] : rows)
-    {
-        SCOPED_TRACE(change.what);
-        const CLoadedMotion file(Changed(change), "a.htr");
-        ASSERT_TRUE(file.loaded);
-        std::string record = recorded;
-        if (record.ends_with('*'))
-            record.replace(record.size() - 1, 1, lostHead);
-        EXPECT_EQ(RecordText(file.motion.Record()), record);
-        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()), tree);
-        const bool hasHead = FindNode(file.motion.motionRoot.Get(), "Head") != nullptr;
-        EXPECT_EQ(hasHead ? TrackOf(file.motion, "Head").m_kRotationKeys.size() : 0, headKeys);
-    }
+    ExpectRead(kSmallHTR, "a.htr", rows);
 }
 
 TEST(TKHTRStream, TakesTheHeaderAsItStands)
 {
-    CLoadedMotion unknownOrder(Changed({"", "EulerRotationOrder ZYX", "EulerRotationOrder xyz"}), "a.htr");
+    CLoadedMotion unknownOrder(Changed(kSmallHTR, {"", "EulerRotationOrder ZYX", "EulerRotationOrder xyz"}),
+                               "a.htr");
     EXPECT_EQ(NormalizedRows(PosedNode(unknownOrder.motion, "Head", 1).m_kMatrix), kMat3Identity);
-    EXPECT_EQ(CLoadedMotion(Changed({"", "FileVersion 3\n", ""}), "a.htr").motion.fileVersion, 1);
+    EXPECT_EQ(CLoadedMotion(Changed(kSmallHTR, {"", "FileVersion 3\n", ""}), "a.htr").motion.fileVersion, 1);
 
-    CLoadedMotion noRate(Changed({"", "DataFrameRate 25\n", ""}), "a.htr");
+    CLoadedMotion noRate(Changed(kSmallHTR, {"", "DataFrameRate 25\n", ""}), "a.htr");
     ASSERT_TRUE(noRate.loaded);
     EXPECT_TRUE(std::isinf(noRate.motion.GetFrequency()));
     EXPECT_EQ(PosedNode(noRate.motion, "Torso", 1).m_kMatrix.Translation(), (Vec3{1, 102, 3}))
@@ -153,7 +112,7 @@ TEST(TKHTRStream, TakesTheHeaderAsItStands)
     ASSERT_TRUE(noRate.motion.Save(noRate.path, 1.0f));
     EXPECT_NE(ReadBytes(noRate.path).find("NumFrames 2\nDataFrameRate 0\n"), std::string::npos);
 
-    CLoadedMotion axisX(Changed({"", "BoneLengthAxis Y", "BoneLengthAxis X"}), "a.htr");
+    CLoadedMotion axisX(Changed(kSmallHTR, {"", "BoneLengthAxis Y", "BoneLengthAxis X"}), "a.htr");
     const Mat4& mesh = FindBoneMesh(*axisX.motion.motionRoot)->m_kMatrix;
     EXPECT_LT(Vec3Length(TransformCoord(kVec3UnitY, mesh) - kVec3UnitX), 1e-6);
 }
@@ -161,7 +120,8 @@ TEST(TKHTRStream, TakesTheHeaderAsItStands)
 // A segment's rows of a number alone repeat the row above, and the first one is no change of the base pose.
 TEST(TKHTRStream, RowsWithoutValuesRepeatTheRowAbove)
 {
-    const CLoadedMotion file(Changed({"", "1 1 2 3 0 0 0 1\n", "1\n1 1 2 3 0 0 0 1\n2\n"}), "a.htr");
+    const CLoadedMotion file(Changed(kSmallHTR, {"", "1 1 2 3 0 0 0 1\n", "1\n1 1 2 3 0 0 0 1\n2\n"}),
+                             "a.htr");
     ASSERT_TRUE(file.loaded);
     const CKeyframeControl& torso = TrackOf(file.motion, "Torso");
     EXPECT_EQ(torso.m_kPositionKeys, (std::vector<Vec3>{{0, 100, 0}, {1, 102, 3}, {1, 102, 3}, {4, 105, 6}}));
@@ -170,50 +130,30 @@ TEST(TKHTRStream, RowsWithoutValuesRepeatTheRowAbove)
 
 TEST(TKHTRStream, RefusesWithReasonAndLine)
 {
-    const std::tuple<Change, const char*> rows[] = {
-        {{"no bytes", "", ""}, "MissingSection 0 [SegmentNames&Hierarchy]"},
-        {{"other text", "", "HIERARCHY\n"}, "MissingSection 1 [SegmentNames&Hierarchy]"},
-        {{"no segments counted", "ments 2", "ments 0"}, "NoRoot 30 NumSegments"},
-        {{"count of segments missing", "NumSegments 2\n", ""}, "NoRoot 29 NumSegments"},
-        {{"a ring", "Torso GLOBAL", "Torso Head"}, "UnknownSegment 23 Torso"},
-        {{"a ring of one", "Torso GLOBAL", "Torso Torso"}, "UnknownSegment 23 Torso"},
-        {{"absurdly many frames", "mes 2", "mes 2000000000"}, "BadCount 6 NumFrames"},
-        {{"frames beyond 32 bits", "mes 2", "mes 99999999999"}, "BadCount 6 NumFrames"},
-        {{"word as count", "Frames 2", "Frames two"}, "BadNumber 6 two"},
-        {{"endless scale factor", "1.000000", "inf"}, "BadNumber 13 inf"},
-        {{"word in the base pose", "Head 0 50", "Head 0 high"}, "BadNumber 21 high"},
-        {{"word in a row", "2 4 5 6", "2 4 x 6"}, "BadNumber 26 x"},
-        {{"not a number in a row", "2 4 5 6", "2 4 nan 6"}, "BadNumber 26 nan"},
-        {{"number too big for a float", "2 4 5 6", "2 4 1e39 6"}, "BadNumber 26 1e39"},
-        {{"row that is no row", "2 4 5 6", "Torso 4 5 6"}, "BadNumber 26 Torso"},
+    const Change rows[] = {
+        {"other text", "", "HIERARCHY\n", "MissingSection 1 [SegmentNames&Hierarchy]"},
+        {"no segments counted", "ments 2", "ments 0", "NoRoot 30 NumSegments"},
+        {"count of segments missing", "NumSegments 2\n", "", "NoRoot 29 NumSegments"},
+        {"a ring", "Torso GLOBAL", "Torso Head", "UnknownSegment 23 Torso"},
+        {"absurdly many frames", "mes 2", "mes 2000000000", "BadCount 6 NumFrames"},
+        {"frames beyond 32 bits", "mes 2", "mes 99999999999", "BadCount 6 NumFrames"},
+        {"word as count", "Frames 2", "Frames two", "BadNumber 6 two"},
+        {"endless scale factor", "1.000000", "inf", "BadNumber 13 inf"},
+        {"word in the base pose", "Head 0 50", "Head 0 high", "BadNumber 21 high"},
+        {"word in a row", "2 4 5 6", "2 4 x 6", "BadNumber 26 x"},
+        {"row that is no row", "2 4 5 6", "Torso 4 5 6", "BadNumber 26 Torso"},
     };
-    for (const auto& [change, recorded] : rows)
-    {
-        SCOPED_TRACE(change.what);
-        const CLoadedMotion file(Changed(change), "a.htr");
-        EXPECT_FALSE(file.loaded);
-        const std::string record = RecordText(file.motion.Record());
-        EXPECT_EQ(record.substr(0, record.find('\n')), std::string("failed ") + recorded);
-    }
+    ExpectRefused(kSmallHTR, "a.htr", rows);
 }
 
 TEST(TKHTRStream, BoundsNamesAndNesting)
 {
-    const std::string text = Changed({"", "Head Torso", std::string(256, 'n') + " Torso"});
+    const std::string text = Changed(kSmallHTR, {"", "Head Torso", std::string(256, 'n') + " Torso"});
     EXPECT_EQ(RecordText(CLoadedMotion(text, "a.htr").motion.Record()),
               "failed BadName 17 " + std::string(80, 'n') + "\n");
     EXPECT_TRUE(CLoadedMotion(Chain(kNestingLimit - 1), "a.htr").loaded);
     const CLoadedMotion deeper(Chain(kNestingLimit), "a.htr");
     EXPECT_EQ(RecordText(deeper.motion.Record()), "failed TooDeep 4003 S3999\n");
-}
-
-TEST(TKHTRStream, ValuesOfSegmentsThatComeLaterAreLost)
-{
-    const std::string base = "Torso 0 100 0 0 0 90 50\n";
-    const CLoadedMotion file("[BasePosition]\n" + base + Changed({"", base, ""}), "a.htr");
-    ASSERT_TRUE(file.loaded);
-    EXPECT_EQ(file.motion.restRoot->m_kMatrix, kMat4Identity);
-    EXPECT_EQ(RecordText(file.motion.Record()), "UnknownSegment 2 Torso\n");
 }
 
 // Two frames of a root that moves and grows, and a child whose own translation does not reach the file.
@@ -237,48 +177,48 @@ Head 0 50 0 0 0 0 20
 2 5 5 5 0 0 0 1
 )";
 
-// What must become of it, but for the rows.
-std::string Written(const std::string& frames, const std::string& torso, const std::string& head)
+// What must become of it with these rows of the root.
+std::string Written(const std::vector<std::string>& torso)
 {
     const std::string columns = "#Fr\tTx\tTy\tTz\tRx\tRy\tRz\tSF\n";
-    return "[Header]\nFileType htr\nDataType HTRS\nFileVersion 1\nNumSegments 2\nNumFrames " + frames +
-           "\nDataFrameRate 25\nEulerRotationOrder ZYX\nCalibrationUnits mm\nRotationUnits Degrees\n"
+    const std::string still = "0.000000 0.000000 0.000000 0.000000 0.000000 0.000000 1.000000";
+    std::string torsoRows;
+    std::string headRows;
+    for (size_t row = 0; row < torso.size(); ++row)
+    {
+        const std::string number = std::to_string(row + 1) + " ";
+        torsoRows += number + torso[row] + "\n";
+        headRows += number + still + "\n";
+    }
+    return "\nDataFrameRate 25\nEulerRotationOrder ZYX\nCalibrationUnits mm\nRotationUnits Degrees\n"
            "GlobalAxisofGravity Y\nBoneLengthAxis Y\nScaleFactor 1.000000\n"
            "[SegmentNames&Hierarchy]\n#CHILD\tPARENT\nTorso GLOBAL\nHead Torso\n"
            "[BasePosition]\n#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength\n"
            "Torso 0.000000 100.000000 0.000000 0.000000 -0.000000 0.000000 50.000000\n"
            "Head 0.000000 50.000000 0.000000 0.000000 -0.000000 0.000000 20.000000\n"
            "#Beginning of Data. Separated by tabs\n[Torso]\n" +
-           columns + torso + "[Head]\n" + columns + head;
+           columns + torsoRows + "[Head]\n" + columns + headRows;
 }
 
 TEST(TKHTRStream, WritesTheseBytes)
 {
-    const std::string turn = " 0.000000 0.000000 0.000000 ";
-    const std::string begin = "1.000000 2.000000 3.000000" + turn + "1.000000\n";
-    const std::string middle = "1.500000 3.000000 0.000000" + turn + "1.500000\n";
-    const std::string end = "2.000000 4.000000 -3.000000" + turn + "2.000000\n";
-    const std::string still = "0.000000 0.000000 0.000000" + turn + "1.000000\n";
-    const auto rowsOf = [](std::initializer_list<std::string> rows) {
-        std::string text;
-        for (int number = 1; const std::string& row : rows)
-            text.append(std::to_string(number++)).append(" ").append(row);
-        return text;
-    };
-    const std::tuple<const char*, float, const char*, std::string, std::string> rows[] = {
-        {"as it is", 1.0f, "2", rowsOf({begin, end}), rowsOf({still, still})},
-        {"twice", 2.0f, "4", rowsOf({begin, middle, end, end}), rowsOf({still, still, still, still})},
-        {"half", 0.5f, "1", rowsOf({begin}), rowsOf({still})},
-        {"nothing", 0.0f, "0", "", ""},
-        {"below nothing", -1.0f, "-2", "", ""},
+    const std::string begin = "1.000000 2.000000 3.000000 0.000000 0.000000 0.000000 1.000000";
+    const std::string middle = "1.500000 3.000000 0.000000 0.000000 0.000000 0.000000 1.500000";
+    const std::string end = "2.000000 4.000000 -3.000000 0.000000 0.000000 0.000000 2.000000";
+    const std::tuple<float, std::string, std::vector<std::string>> rows[] = {
+        {1.0f, "2", {begin, end}}, {2.0f, "4", {begin, middle, end, end}},
+        {0.5f, "1", {begin}},      {0.0f, "0", {}},
+        {-1.0f, "-2", {}},
     };
     CLoadedMotion file(kMoving, "a.htr");
     ASSERT_TRUE(file.loaded);
-    for (const auto& [what, frameScale, frames, torso, head] : rows)
+    for (const auto& [frameScale, frames, torso] : rows)
     {
-        SCOPED_TRACE(what);
+        SCOPED_TRACE(frameScale);
         ASSERT_TRUE(file.motion.Save(file.folder.Path("b.HTR"), frameScale));
-        EXPECT_EQ(ReadBytes(file.folder.Path("b.HTR")), Written(frames, torso, head));
+        EXPECT_EQ(ReadBytes(file.folder.Path("b.HTR")),
+                  "[Header]\nFileType htr\nDataType HTRS\nFileVersion 1\nNumSegments 2\nNumFrames " + frames +
+                      Written(torso));
     }
 }
 
@@ -330,23 +270,20 @@ TEST(TKHTRStream, WritesThePosesOfTheTree)
 // What is taken from memory after a save is what the file has, quarter turns and all.
 TEST(TKHTRStream, QuarterTurnsReadBackWhereThatIsAskedFor)
 {
-    const struct
-    {
-        Vec3 degrees;
-        double flippedBy; // read back from what the rule for all poses writes
-    } rows[] = {
+    // flippedBy: read back from what the rule for all poses writes
+    const std::pair<Vec3, double> rows[] = {
         {{0, 90, 0}, 180.0},     {{0, -90, 0}, 180.0}, {{30, 90, 40}, 180.0},
         {{-20, -90, 70}, 180.0}, {{5, 89.9f, 3}, 0.0}, {{5, 60, 3}, 0.0},
     };
-    for (const auto& row : rows)
+    for (const auto& [degrees, flippedBy] : rows)
     {
-        SCOPED_TRACE(row.degrees.x + row.degrees.y);
+        SCOPED_TRACE(degrees.x + degrees.y);
         for (const EQuarterTurns turns : {EQuarterTurns::ReadBack, EQuarterTurns::Flipped})
         {
             CLoadedMotion file(kMoving, "a.htr");
             file.motion.quarterTurns = turns;
             CNode& head = *FindNode(file.motion.motionRoot.Get(), "Head");
-            const Mat3 turn = EulerToMat3("ZYX", row.degrees);
+            const Mat3 turn = EulerToMat3("ZYX", degrees);
             static_cast<CKeyframeControl*>(head.GetControl())->m_kRotationKeys[1] = QuatFromMat3(turn);
             const std::string path = file.folder.Path("b.htr");
             ASSERT_TRUE(file.motion.Save(path, 1.0f));
@@ -356,7 +293,7 @@ TEST(TKHTRStream, QuarterTurnsReadBackWhereThatIsAskedFor)
             if (turns == EQuarterTurns::ReadBack)
                 EXPECT_LT(DegreesBetween(read, turn), kTolerance);
             else
-                EXPECT_NEAR(DegreesBetween(read, turn), row.flippedBy, 0.1);
+                EXPECT_NEAR(DegreesBetween(read, turn), flippedBy, 0.1);
             TakeWrittenPoses(file.motion);
             EXPECT_LT(DegreesBetween(NormalizedRows(PosedNode(file.motion, "Head", 1).m_kMatrix), read),
                       kTolerance);
@@ -368,7 +305,7 @@ TEST(TKHTRStream, QuarterTurnsReadBackWhereThatIsAskedFor)
 // written.
 TEST(TKHTRStream, TellsSegmentsOfOneNameApart)
 {
-    std::string text = Changed({"", "Head Torso\n", "Head Torso\nHead Torso\n"});
+    std::string text = Changed(kSmallHTR, {"", "Head Torso\n", "Head Torso\nHead Torso\n"});
     text.replace(text.find("NumSegments 2"), 13, "NumSegments 3");
     CLoadedMotion file(text, "a.htr");
     ASSERT_TRUE(file.loaded);
@@ -389,12 +326,9 @@ TEST(TKHTRStream, KeepsTheSkeletonFromFileToFile)
 {
     CLoadedMotion file(kSmallHTR, "a.htr");
     const Mat4 base = FindNode(file.motion.restRoot.Get(), "Head")->m_kMatrix;
-    const std::string whole(kSmallHTR);
-    const std::string head = whole.substr(0, whole.find("[BasePosition]"));
     for (int i = 0; i < 3; ++i)
     {
         ASSERT_TRUE(file.motion.Save(file.path, 1.0f));
-        EXPECT_TRUE(ReadBytes(file.path).starts_with(head)) << "header and hierarchy";
         ASSERT_TRUE(file.motion.Load(file.path));
         const Mat4& again = FindNode(file.motion.restRoot.Get(), "Head")->m_kMatrix;
         EXPECT_LT(DegreesBetween(NormalizedRows(again), NormalizedRows(base)), kTolerance);

@@ -12,6 +12,7 @@
 #include <cmath>
 #include <gtest/gtest.h>
 #include <numeric>
+#include <tuple>
 
 namespace gw {
 namespace {
@@ -113,26 +114,17 @@ TEST(HoldFoot, FreePathIsLeftForAContactAloneAndWithoutACorner)
 
 TEST(HoldFoot, ShortDriftIsTakenAwayAndALongOneKept)
 {
-    const struct
+    // A sensor's drift and a dragged foot: the step in a frame, and how much of its way is kept.
+    for (const auto& [step, least, most] : {std::tuple{0.05f, 0.0f, 0.1f}, {1.5f, 0.85f, 1.1f}})
     {
-        const char* what;
-        float step;    // of the source's foot in a frame
-        float least;   // of what is kept of its way
-        float largest; // the same
-    } rows[] = {
-        {"a sensor's drift", 0.05f, 0.0f, 0.1f},
-        {"a dragged foot", 1.5f, 0.85f, 1.1f},
-    };
-    for (const auto& row : rows)
-    {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(step);
         Foot foot;
         for (int frame = 0; frame < 120; ++frame)
-            foot.Add({0.0f, 0.0f, row.step * static_cast<float>(frame)}, 0.0f, 0.0f);
+            foot.Add({0.0f, 0.0f, step * static_cast<float>(frame)}, 0.0f, 0.0f);
         const std::vector<Vec3> path = foot.Hold({{0, 120}});
-        const float kept = (path[119].z - path[0].z) / (119.0f * row.step);
-        EXPECT_GE(kept, row.least);
-        EXPECT_LE(kept, row.largest);
+        const float kept = (path[119].z - path[0].z) / (119.0f * step);
+        EXPECT_GE(kept, least);
+        EXPECT_LE(kept, most);
     }
 }
 
@@ -176,28 +168,23 @@ double YieldedAngle(double asked, double kneeAngle)
 
 TEST(YieldKnee, BentKneeReachesWhatIsAskedAndAStraightOneKeepsItsAngle)
 {
-    const struct
-    {
-        const char* what;
-        double angle;   // degrees
-        double more;    // asked beyond the own reach
-        double reached; // of that, at the least
-        double turned;  // degrees that the knee may turn
-    } rows[] = {
+    // degrees: of the knee; more: asked beyond the own reach; reached: of that, at the least; turned:
+    // degrees, at most
+    const std::tuple<const char*, double, double, double, double> rows[] = {
         {"bent, shorter", 60.0, -20.0, -18.0, 10.0},    {"bent, longer", 60.0, 20.0, 18.0, 10.0},
         {"straight, noise", 2.0, -0.3, 0.0, 1.0},       {"straight, longer", 2.0, 30.0, 0.0, 2.1},
         {"out of all reach", 90.0, 900.0, 150.0, 90.0},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, degrees, more, reached, turned] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const double angle = row.angle / 57.29578;
+        SCOPED_TRACE(what);
+        const double angle = degrees / 57.29578;
         const double own = ReachAt(kLegLengths, std::sin(0.5 * angle));
-        const double yielded = YieldedAngle(own + row.more, angle);
+        const double yielded = YieldedAngle(own + more, angle);
         const double reach = ReachAt(kLegLengths, std::sin(0.5 * yielded));
-        EXPECT_GE((reach - own) / row.more, row.reached / row.more);
-        EXPECT_LE(std::fabs(reach - own), std::fabs(row.more) + 0.05);
-        EXPECT_LE(std::fabs(yielded - angle) * 57.29578, row.turned);
+        EXPECT_GE((reach - own) / more, reached / more);
+        EXPECT_LE(std::fabs(reach - own), std::fabs(more) + 0.05);
+        EXPECT_LE(std::fabs(yielded - angle) * 57.29578, turned);
         EXPECT_LE(reach, 705.0);
     }
 }

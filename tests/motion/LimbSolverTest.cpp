@@ -1,6 +1,6 @@
 #include "CLegSolver.h"
+#include "Rotations.h"
 
-#include <cmath>
 #include <gtest/gtest.h>
 #include <random>
 #include <tuple>
@@ -47,13 +47,8 @@ Vec3 AcrossGoal(const Vec3& point, const Vec3& goal)
 
 bool IsRotation(const Mat3& m)
 {
-    const Mat3 product = m * Mat3Transpose(m);
-    for (int i = 0; i < 9; ++i)
-    {
-        if (std::fabs(product.m[i] - kMat3Identity.m[i]) > 1e-4f)
-            return false;
-    }
-    return Vec3Dot(Vec3Cross(m.Row(0), m.Row(1)), m.Row(2)) > 0.0;
+    return DegreesBetween(m * Mat3Transpose(m), kMat3Identity) < 0.01 &&
+           Vec3Dot(Vec3Cross(m.Row(0), m.Row(1)), m.Row(2)) > 0.0;
 }
 
 TEST(CLegSolver, ReachesRandomGoalsWithTheKneeTowardTheHint)

@@ -2,6 +2,7 @@
 
 #include "CKeyframeControl.h"
 #include "CMotionSampler.h"
+#include "SceneBytes.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -115,6 +116,60 @@ std::string WithCarriageReturns(std::string_view text)
     for (const char c : text)
         out += c == '\n' ? std::string("\r\n") : std::string(1, c);
     return out;
+}
+
+std::string Changed(std::string_view text, const Change& change)
+{
+    std::string changed(text);
+    const size_t at = changed.find(change.from);
+    EXPECT_NE(at, changed.npos) << change.from;
+    return change.from.empty() ? change.to : changed.replace(at, change.from.size(), change.to);
+}
+
+void ExpectSame(std::string_view text, const char* fileName, std::span<const Change> rows)
+{
+    const CLoadedMotion plain(text, fileName);
+    for (const Change& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CLoadedMotion file(Changed(text, row), fileName);
+        EXPECT_EQ(RecordText(file.motion.Record()), "");
+        ASSERT_TRUE(file.loaded);
+        EXPECT_EQ(file.motion.GetKeyCount(), plain.motion.GetKeyCount());
+        EXPECT_EQ(file.motion.GetFrequency(), plain.motion.GetFrequency());
+        EXPECT_EQ(DescribeRoot(file.motion.motionRoot.Get()), DescribeRoot(plain.motion.motionRoot.Get()));
+    }
+}
+
+void ExpectRead(std::string_view text, const char* fileName, std::span<const Change> rows)
+{
+    const auto keysOfLast = [](const CMotionFile& motion) {
+        const CNode& last = *NodesOf(*motion.motionRoot).back();
+        return static_cast<int>(TrackOf(motion, last.GetName()).m_kRotationKeys.size());
+    };
+    const CLoadedMotion plain(text, fileName);
+    for (const Change& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CLoadedMotion file(Changed(text, row), fileName);
+        EXPECT_EQ(RecordText(file.motion.Record()), row.record);
+        ASSERT_EQ(TreeText(file.motion.motionRoot.Get()),
+                  row.tree ? row.tree : TreeText(plain.motion.motionRoot.Get()));
+        EXPECT_EQ(keysOfLast(file.motion), row.keys < 0 ? keysOfLast(plain.motion) : row.keys);
+    }
+}
+
+void ExpectRefused(std::string_view text, const char* fileName, std::span<const Change> rows)
+{
+    for (const Change& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CLoadedMotion file(Changed(text, row), fileName);
+        EXPECT_FALSE(file.loaded);
+        EXPECT_FALSE(file.motion.motionRoot);
+        const std::string record = RecordText(file.motion.Record());
+        EXPECT_EQ(record.substr(0, record.find('\n')), "failed " + row.record);
+    }
 }
 
 } // namespace gw

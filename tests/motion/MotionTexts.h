@@ -3,6 +3,7 @@
 #include "CMotionFile.h"
 #include "TempFolder.h"
 
+#include <span>
 #include <string>
 #include <string_view>
 
@@ -34,6 +35,23 @@ bool IsFinite(CNode& root);
 
 /// A text with its lines' ends changed to CR LF.
 std::string WithCarriageReturns(std::string_view text);
+
+/// A row of a table that replaces one piece of a text. An empty `from` stands for the whole text.
+struct Change
+{
+    const char* what;
+    std::string from;
+    std::string to;
+    std::string record{};       ///< as RecordText gives it; of a text that is refused, its first line
+    int keys = -1;              ///< rotations of the tree's last node; below 0 as many as without the change
+    const char* tree = nullptr; ///< null for the tree without the change
+};
+
+std::string Changed(std::string_view text, const Change& change);
+/// Every change leaves the motion as it is and is no matter for the record.
+void ExpectSame(std::string_view text, const char* fileName, std::span<const Change> rows);
+void ExpectRead(std::string_view text, const char* fileName, std::span<const Change> rows);
+void ExpectRefused(std::string_view text, const char* fileName, std::span<const Change> rows);
 
 /// Two joints of three frames: rotation orders of their own, an end site.
 inline constexpr std::string_view kSmallBVH = R"(HIERARCHY

@@ -44,8 +44,6 @@ TEST(CTextLines, EndsLinesAndCutsLongOnes)
     const std::string full(CTextLines::kPieceLength, 'x');
     const std::string shorter(CTextLines::kPieceLength - 1, 'x');
     const std::tuple<const char*, std::string, std::vector<std::string>> rows[] = {
-        {"no bytes", "", {}},
-        {"line feeds", "a\n\nb\n", {"1:a", "2:", "3:b"}},
         {"carriage returns and line feeds, mixed", "a\r\n\r\nb\nc\r\n", {"1:a", "2:", "3:b", "4:c"}},
         {"no end behind the last line", "a\nb", {"1:a", "2:b"}},
         {"a lone carriage return is a character", "a\rb\n\r", {"1:a\rb", "2:\r"}},

@@ -1,61 +1,31 @@
 // A trunk that leans as the source's whatever its proportions, and hands that keep their gaps.
 
-#include "Angles.h"
 #include "CFaithfulArm.h"
 #include "CHandPlan.h"
 #include "CKeyframeControl.h"
 #include "CTrunkAim.h"
+#include "CWalker.h"
 #include "Directions.h"
 #include "HostBones.h"
 #include "Skeleton.h"
 
-#include <cmath>
 #include <gtest/gtest.h>
+#include <tuple>
 
 namespace gw {
 namespace {
 
-CNode* AddJoint(CNode* parent, const std::string& name, const Vec3& offset, const Mat3& turn = kMat3Identity)
-{
-    auto* const node = new CNode;
-    node->SetName(name.c_str());
-    node->m_kMatrix = Mat4Compose(turn, offset);
-    if (parent)
-        parent->AttachChild(node);
-    return node;
-}
-
-// The target's make, but for legs below the knees.
-Ref<CNode> MakeTarget()
-{
-    const Mat3 down = Mat3FromAxisAngle(kVec3UnitZ, kPi);
-    Ref<CNode> root = AddJoint(nullptr, "LowerTorso", {0.0f, 923.0f, 0.0f});
-    CNode* const chest =
-        AddJoint(AddJoint(root.Get(), "Waist", {0.0f, 95.0f, 0.0f}), "UpperTorso", {0.0f, 150.0f, 0.0f});
-    AddJoint(AddJoint(chest, "Neck", {0.0f, 265.0f, 0.0f}), "Head", {0.0f, 95.0f, 0.0f});
-    for (const float side : {1.0f, -1.0f})
-    {
-        const std::string name = side > 0.0f ? "L" : "R";
-        AddJoint(AddJoint(root.Get(), name + "Pelvis", kVec3Zero, down), name + "Thigh",
-                 {-95.0f * side, 138.0f, 0.0f});
-        CNode* const collar = AddJoint(chest, name + "Collar", {25.0f * side, 215.0f, 0.0f},
-                                       Mat3FromAxisAngle(kVec3UnitZ, -0.5f * kPi * side));
-        CNode* const arm = AddJoint(collar, name + "UpperArm", {0.0f, 145.0f, 0.0f});
-        AddJoint(AddJoint(arm, name + "Forearm", {0.0f, 285.0f, 0.0f}), name + "Hand", {0.0f, 255.0f, 0.0f});
-    }
-    root->UpdateScene(0.0f, true);
-    return root;
-}
-
 // A source with hip joints ahead of its spine, a short small of the back and a long chest.
-Ref<CNode> MakeSource()
+constexpr MadeBone kSource[] = {
+    {"Hips", "", {0.0f, 90.0f, 0.0f}},       {"LHip", "Hips", {9.0f, -6.0f, 3.0f}},
+    {"RHip", "Hips", {-9.0f, -6.0f, 3.0f}},  {"Spine", "Hips", {0.0f, 8.0f, -1.0f}},
+    {"Chest", "Spine", {0.0f, 8.0f, 0.0f}},  {"Throat", "Chest", {0.0f, 34.0f, 0.0f}},
+    {"Skull", "Throat", {0.0f, 9.0f, 0.0f}},
+};
+
+// At rest, with its world matrices.
+Ref<CNode> Standing(const Ref<CNode>& root)
 {
-    Ref<CNode> root = AddJoint(nullptr, "Hips", {0.0f, 90.0f, 0.0f});
-    AddJoint(root.Get(), "LHip", {9.0f, -6.0f, 3.0f});
-    AddJoint(root.Get(), "RHip", {-9.0f, -6.0f, 3.0f});
-    CNode* const chest =
-        AddJoint(AddJoint(root.Get(), "Spine", {0.0f, 8.0f, -1.0f}), "Chest", {0.0f, 8.0f, 0.0f});
-    AddJoint(AddJoint(chest, "Throat", {0.0f, 34.0f, 0.0f}), "Skull", {0.0f, 9.0f, 0.0f});
     root->UpdateScene(0.0f, true);
     return root;
 }
@@ -80,8 +50,8 @@ Vec3 LineInTrunk(CNode& source, CNode& target)
 
 TEST(CTrunkAim, LineFromHipsToNeckFollowsTheSourcesAsAtRestAndTheHeadKeepsItsTurn)
 {
-    const Ref<CNode> source = MakeSource();
-    const Ref<CNode> target = MakeTarget();
+    const Ref<CNode> source = Standing(&CMadeFigure(kSource).Root());
+    const Ref<CNode> target = Standing(MakeTarget());
     CRetargeter table;
     table.SetScenes(source.Get(), target.Get());
     for (const auto& [bone, joint] : {std::pair{"LowerTorso", "Hips"},
@@ -115,7 +85,7 @@ TEST(CTrunkAim, LineFromHipsToNeckFollowsTheSourcesAsAtRestAndTheHeadKeepsItsTur
 }
 
 // A body that sits with its thighs along z; its hands are far from everything.
-TouchPoints Sitting(float scale)
+TouchPoints Sitting()
 {
     TouchPoints body;
     for (size_t side = 0; side < 2; ++side)
@@ -123,7 +93,7 @@ TouchPoints Sitting(float scale)
         const float x = side == 0 ? 1.0f : -1.0f;
         body.hips[side] = {95.0f * x, 450.0f, 0.0f};
         body.knees[side] = {95.0f * x, 450.0f, 360.0f};
-        body.hands[side] = Vec3{400.0f * x, 700.0f, 200.0f} * scale;
+        body.hands[side] = {400.0f * x, 700.0f, 200.0f};
     }
     body.neck = {0.0f, 1090.0f, 0.0f};
     body.head = {0.0f, 1290.0f, 0.0f};
@@ -133,38 +103,33 @@ TouchPoints Sitting(float scale)
 TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
 {
     const Vec3 free{95.0f, 420.0f, 480.0f}; // past the knee and below it
-    const struct
-    {
-        const char* what;
-        Vec3 source;
-        Vec3 other;  // hand of the source
-        double left; // its gap to what it touches
-    } rows[] = {
+    // hands of the source; left: the gap of the first one to what it touches
+    const std::tuple<const char*, Vec3, Vec3, double> rows[] = {
         {"on a thigh", {95.0f, 510.0f, 250.0f}, {-400.0f, 700.0f, 200.0f}, 60.0},
         {"on the floor", {400.0f, 40.0f, 250.0f}, {-400.0f, 700.0f, 200.0f}, 40.0},
         {"that clap", {30.0f, 900.0f, 400.0f}, {-30.0f, 900.0f, 400.0f}, 60.0},
         {"at the head", {0.0f, 1290.0f, 90.0f}, {-400.0f, 700.0f, 200.0f}, 90.0},
         {"far from it all", {400.0f, 700.0f, 400.0f}, {-400.0f, 700.0f, 200.0f}, -1.0},
     };
-    for (const auto& row : rows)
+    for (size_t touched = 0; const auto& [what, leftHand, rightHand, left] : rows)
     {
-        SCOPED_TRACE(row.what);
-        TouchPoints source = Sitting(1.0f);
+        SCOPED_TRACE(what);
+        TouchPoints source = Sitting();
         TouchPoints target = source;
-        source.hands = {row.source, row.other};
+        source.hands = {leftHand, rightHand};
         target.hands[0] = free;
         CHandPlan plan(40, 1.0 / 30.0, true);
         for (size_t frame = 0; frame < 40; ++frame)
             plan.Add(frame, source, target);
         plan.Solve();
-        EXPECT_EQ(plan.Touches(source), row.left >= 0.0);
+        EXPECT_EQ(plan.Touches(source), left >= 0.0);
         const Vec3 hand = free + plan.Way(0, 20);
         const Vec3 other = target.hands[1] + plan.Way(1, 20);
         const Vec3 along = hand - Vec3{95.0f, 450.0f, std::min(hand.z, 360.0f)};
         const double gaps[] = {Vec3Length(along), static_cast<double>(hand.y), Vec3Length(hand - other),
                                Vec3Length(hand - target.head)};
-        if (row.left >= 0.0)
-            EXPECT_NEAR(gaps[&row - rows], row.left, 25.0) << "of 120 and more";
+        if (left >= 0.0)
+            EXPECT_NEAR(gaps[touched++], left, 25.0) << "of 120 and more";
         else
             EXPECT_EQ(Vec3Length(plan.Way(0, 20)), 0.0);
     }
@@ -172,8 +137,8 @@ TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
 
 TEST(CFaithfulArm, HandGoesItsWayAndTheElbowStaysOnItsSide)
 {
-    const Ref<CNode> source = MakeTarget();
-    const Ref<CNode> target = MakeTarget();
+    const Ref<CNode> source = Standing(MakeTarget());
+    const Ref<CNode> target = Standing(MakeTarget());
     CRetargeter table;
     table.SetScenes(source.Get(), target.Get());
     for (const char* bone : {"LUpperArm", "LForearm", "LHand"})

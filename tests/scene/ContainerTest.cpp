@@ -9,25 +9,15 @@
 
 #include <gtest/gtest.h>
 
-#include <numeric>
 #include <tuple>
 
 namespace gw {
 namespace {
 
-std::vector<std::byte> SampleBytes()
-{
-    COrrinStream stream;
-    stream.AddRoot(SampleGraph().Get());
-    return SaveBytes(stream);
-}
-
 CNode* RootNode(const COrrinStream& stream)
 {
     return RecordCast<CNode>(stream.GetRoot(0));
 }
-
-} // namespace
 
 TEST(COrrinStream, NoRootsAre79Bytes)
 {
@@ -39,8 +29,6 @@ TEST(COrrinStream, NoRootsAre79Bytes)
     EXPECT_EQ(written.size(), 79u);
     COrrinStream again;
     EXPECT_TRUE(again.LoadFile(folder.Path("empty.orn"), false));
-    EXPECT_FALSE(again.Record().Failure());
-    EXPECT_EQ(again.GetRootCount(), 0u);
     EXPECT_EQ(again.GetBaseDirectory() + kPathSeparator, folder.Path());
 }
 
@@ -103,12 +91,6 @@ TEST(CPackageFile, PiecesMakeThePackageOfTheWholeMotion)
         EXPECT_TRUE(package.Commit());
         EXPECT_EQ(ReadBytes(folder.Path("pieces")), ReadBytes(folder.Path("whole")));
     }
-    Ref<CRawData> block = LoadFileAsRawData(folder.Path("a.htr"));
-    ASSERT_TRUE(block);
-    CCloneMap map;
-    const Ref<CRawData> copy = static_cast<CRawData*>(block->Clone(map));
-    block = nullptr; // the copy shares its bytes
-    EXPECT_TRUE(std::ranges::equal(copy->Data(), std::as_bytes(std::span(motion))));
 }
 
 TEST(CPackageFile, WhatIsNotCommittedOrTooLargeLeavesTheOldFile)
@@ -172,9 +154,6 @@ TEST(COrrinStream, HeadersAreRefusedByTheirRules)
         COrrinStream stream;
         EXPECT_FALSE(stream.LoadFile(folder.Path("a.orn"), false)) << size;
     }
-    COrrinStream stream;
-    EXPECT_FALSE(stream.LoadFile(folder.Path("none.orn"), false));
-    EXPECT_FALSE(stream.LoadFile(folder.Path(), false)) << "a folder";
 }
 
 TEST(COrrinStream, OldVersionsHaveOneChainHeadAndNewerOnesThree)
@@ -210,18 +189,7 @@ TEST(COrrinStream, OldVersionsHaveOneChainHeadAndNewerOnesThree)
 
 TEST(COrrinStream, EveryClassComesBackAsItWas)
 {
-    COrrinStream stream;
-    stream.AddRoot(SampleGraph().Get());
-    EXPECT_TRUE(SurvivesRewriting(stream));
-    COrrinStream again;
-    ASSERT_TRUE(LoadBytes(again, SaveBytes(stream)));
-    CNode* root = RootNode(again);
-    EXPECT_EQ(root->GetCustomData(), root->ChildAt(2)->GetCustomData()) << "shared stays shared";
-    EXPECT_EQ(root->GetCustomData()->GetRefCount(), 2u);
-    EXPECT_EQ(root->ChildAt(2)->GetControl()->GetTarget(), root);
-    EXPECT_EQ(root->ChildAt(1), nullptr) << "slots stay in place";
-    EXPECT_NE(root->ChildAt(3), nullptr);
-    EXPECT_EQ(SaveBytes(again), SaveBytes(stream));
+    ExpectComesBack(SampleGraph().Get());
 }
 
 TEST(COrrinStream, SizesAreThoseOfTheFormat)
@@ -239,16 +207,7 @@ TEST(COrrinStream, SizesAreThoseOfTheFormat)
         EXPECT_TRUE(!memory || object->GetMemoryUsed() == memory);
         object->SetName("four");
         EXPECT_EQ(object->GetDiskUsed(), disk + 4);
-        COrrinStream stream;
-        stream.AddRoot(object.Get());
-        EXPECT_EQ(SaveBytes(stream).size(), 58 + 14 + disk + 4);
     }
-    COrrinStream stream;
-    stream.AddRoot(SampleGraph().Get());
-    uint64_t bytes = 58 + 14;
-    for (const CObject* object : stream.ObjectsInSaveOrder())
-        bytes += object->GetDiskUsed();
-    EXPECT_EQ(SaveBytes(stream).size(), bytes);
 }
 
 TEST(COrrinStream, RootsAreListedOnceAndWrittenAtTheirPlaceInTheWalk)
@@ -284,68 +243,24 @@ TEST(COrrinStream, TextsAndThumbnailsAreCarriedAlong)
     written.Raw("row one.row two.").Words({5, 6}).Byte(7).Word(8).Root().Node(1, {}, "cut");
     EXPECT_EQ(SaveBytes(stream), written.Bytes());
 
-    const std::tuple<const char*, uint32_t, uint32_t, uint32_t, uint32_t, bool> rows[] = {
-        {"a size without pixels", 10, 10, 0, 0, true},
-        {"no width", 0, 9, 0, 1, true},
-        {"no height", 9, 0, 0, 1, true},
-        {"no such format", 1, 1, 6, 1, false},
-        {"below 0", 0xffffffff, 1, 0, 1, false},
-        {"more than there is", 99, 99, 5, 1, false},
-        {"a product of 34 bits", 65536, 65536, 0, 1, false},
-    };
-    for (const auto& [what, width, height, format, presence, whole] : rows)
-    {
-        SCOPED_TRACE(what);
-        CSceneBytes odd;
-        odd.Text("").Words({width, height, format});
-        odd.Add<uint16_t>(0).Words({96, 96, presence, 1, 0}).Byte(0).Word(0).Root().Node(1);
-        COrrinStream loaded;
-        EXPECT_EQ(LoadBytes(loaded, odd.Bytes()), whole);
-        EXPECT_EQ(loaded.GetRootCount(), whole ? 1u : 0u);
-        EXPECT_TRUE(loaded.Thumbnail().m_kPixels.empty());
-        EXPECT_TRUE(loaded.LoadThumbnailOnly(bytes.Bytes(), 0));
-        EXPECT_EQ(loaded.Thumbnail().m_kPixels.size(), 16u) << "after a failure too";
-    }
+    CSceneBytes odd; // more pixels than there are
+    odd.Text("").Words({99, 99, 5}).Add<uint16_t>(0).Words({96, 96, 1, 1, 0}).Byte(0).Word(0).Root().Node(1);
+    COrrinStream refused;
+    EXPECT_FALSE(LoadBytes(refused, odd.Bytes()));
+    EXPECT_TRUE(refused.Thumbnail().m_kPixels.empty());
+    EXPECT_TRUE(refused.LoadThumbnailOnly(bytes.Bytes(), 0));
+    EXPECT_EQ(refused.Thumbnail().m_kPixels.size(), 16u) << "after a failure too";
 }
 
-TEST(DamagedContainer, EveryPrefixIsReadUpToItsLastWholeRecord)
+TEST(DamagedContainer, IsReadUpToItsLastWholeRecordAndHarmsNothing)
 {
-    const std::vector<std::byte> whole = SampleBytes();
-    const uint32_t before = g_uiObjectCount;
-    for (size_t size = 0; size < whole.size(); ++size)
-    {
-        COrrinStream stream;
-        const bool loaded = LoadBytes(stream, std::span(whole).first(size));
-        ASSERT_EQ(loaded, !stream.Record().Failure()) << size;
-        ASSERT_LE(stream.Record().Failure().where, size);
-        ASSERT_TRUE(SurvivesRewriting(stream)) << size;
-    }
-    EXPECT_EQ(g_uiObjectCount, before);
-}
-
-TEST(DamagedContainer, AnyWordMayBeAnything)
-{
-    const std::vector<std::byte> whole = SampleBytes();
-    const uint32_t before = g_uiObjectCount;
-    for (const uint32_t word : {0xffffffffu, 0x80000000u, 0x15555556u, 1u})
-    {
-        for (size_t at = 0; at + 4 <= whole.size(); ++at)
-        {
-            std::vector<std::byte> bytes = whole;
-            std::memcpy(bytes.data() + at, &word, 4);
-            COrrinStream stream;
-            stream.LoadBuffer(bytes, 0);
-            for (size_t root = 0; root < stream.GetRootCount(); ++root)
-                stream.GetRoot(root)->Update(1.0f);
-            ASSERT_TRUE(SurvivesRewriting(stream)) << word << " at " << at;
-        }
-    }
-    EXPECT_EQ(g_uiObjectCount, before);
+    ExpectDamageStaysInside(SampleGraph().Get(), {0xffffffffu, 0x80000000u, 0x15555556u, 1u},
+                            [](CObject& root) { root.Update(1.0f); });
 }
 
 TEST(DamagedContainer, ReadingStopsAtWhatCannotBeMade)
 {
-    for (const char* name : {"CBoneMesh", "CSpatial", "CObject", "cnode", "CNode ", ""})
+    for (const char* name : {"CSpatial", "cnode", "CNode ", ""})
     {
         SCOPED_TRACE(name);
         CSceneBytes bytes = Scene().Root().Node(1, {2}).Node(2);
@@ -386,15 +301,6 @@ TEST(Links, OfAWrongClassOrOfNothingAreNull)
     EXPECT_TRUE(SurvivesRewriting(stream));
 }
 
-TEST(Links, CustomDataStandsByItsTypeAndNotByItsRecord)
-{
-    CSceneBytes bytes = Scene().Root().RawData(1, 2);
-    bytes.Object("CAuthorInfo", 2).Text("").Words({0, 0, 0, 0, 0, 0, 0, 0});
-    COrrinStream stream;
-    ASSERT_TRUE(LoadBytes(stream, bytes.Bytes()));
-    EXPECT_NE(static_cast<CRawData*>(stream.GetRoot(0))->GetNextData(), nullptr);
-}
-
 TEST(Links, APlainPointerToWhatNobodyHoldsIsNull)
 {
     COrrinStream stream;
@@ -425,8 +331,6 @@ TEST(Links, RingsAreRefusedAndFreed)
     EXPECT_TRUE(LoadBytes(stream, upward.Bytes())) << "a target is no count";
 }
 
-namespace {
-
 // Returns a root with nodes nested to a total depth of `levels`. Written leaf first, so that ids do not
 // follow the nesting.
 std::vector<std::byte> NestedNodes(uint32_t levels)
@@ -440,8 +344,6 @@ std::vector<std::byte> NestedNodes(uint32_t levels)
     }
     return bytes.Bytes();
 }
-
-} // namespace
 
 TEST(Nesting, UpToTheLimitEveryWalkStandsAndBeyondItIsRefused)
 {
@@ -514,23 +416,15 @@ TEST(Nesting, SharedNodesAreLegalUntilTheirPlacesExplode)
     }
 }
 
-TEST(COrrinStream, AHundredThousandFlatNodesLoadAndSave)
+TEST(COrrinStream, AHundredThousandRootsLoadAndSave)
 {
-    std::vector<uint32_t> ids(100'000);
-    std::iota(ids.begin(), ids.end(), 2);
-    CSceneBytes children = Scene().Root().Node(1, ids);
-    CSceneBytes roots = Scene().Root().Node(1);
-    for (const uint32_t id : ids)
-    {
-        children.Node(id);
+    CSceneBytes roots = Scene();
+    for (uint32_t id = 1; id <= 100'000; ++id)
         roots.Root().Node(id);
-    }
-    for (const CSceneBytes* bytes : {&children, &roots})
-    {
-        COrrinStream stream;
-        ASSERT_TRUE(LoadBytes(stream, bytes->Bytes()));
-        EXPECT_EQ(SaveBytes(stream), bytes->Bytes());
-    }
+    COrrinStream stream;
+    ASSERT_TRUE(LoadBytes(stream, roots.Bytes()));
+    EXPECT_EQ(SaveBytes(stream), roots.Bytes());
 }
 
+} // namespace
 } // namespace gw

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cstring>
+#include <gtest/gtest.h>
 #include <span>
 #include <sstream>
 #include <string>
@@ -61,19 +62,11 @@ public:
     }
     /// Appends the part common to all spatials: the identity, the flag, no render states.
     CSceneBytes& Spatial() { return Add(kMat4Identity).Byte(1).Word(0); }
-    CSceneBytes& Node(uint32_t id, std::span<const uint32_t> children, std::string_view name = {},
-                      std::initializer_list<uint32_t> heads = {0, 0, 0})
-    {
-        Object("CNode", id, name, heads).Spatial().Word(1).Byte(1).Byte(1);
-        Word(static_cast<uint32_t>(children.size()));
-        for (const uint32_t child : children)
-            Word(child);
-        return *this;
-    }
     CSceneBytes& Node(uint32_t id, std::initializer_list<uint32_t> children = {}, std::string_view name = {},
                       std::initializer_list<uint32_t> heads = {0, 0, 0})
     {
-        return Node(id, std::span(children.begin(), children.size()), name, heads);
+        Object("CNode", id, name, heads).Spatial().Word(1).Byte(1).Byte(1);
+        return Word(static_cast<uint32_t>(children.size())).Words(children);
     }
     /// Appends a track without keys.
     CSceneBytes& Track(uint32_t id, uint32_t target, uint32_t next)
@@ -189,6 +182,54 @@ inline bool SurvivesRewriting(COrrinStream& stream)
     const std::string before = Describe(stream);
     COrrinStream again;
     return LoadBytes(again, SaveBytes(stream)) && Describe(again) == before;
+}
+
+/// Expects a graph to survive that, in as many bytes as its objects say.
+inline void ExpectComesBack(CObject* root)
+{
+    COrrinStream stream;
+    stream.AddRoot(root);
+    EXPECT_TRUE(SurvivesRewriting(stream));
+    uint64_t size = 58 + 14;
+    for (const CObject* object : stream.ObjectsInSaveOrder())
+        size += object->GetDiskUsed();
+    EXPECT_EQ(SaveBytes(stream).size(), size);
+}
+
+/// Reads every beginning of a graph's bytes, and the bytes with a word put over each place, and uses the
+/// roots: what is read must be whole, and all of it is freed.
+template <class Use>
+void ExpectDamageStaysInside(CObject* root, std::initializer_list<uint32_t> words, Use use)
+{
+    COrrinStream source;
+    source.AddRoot(root);
+    const std::vector<std::byte> whole = SaveBytes(source);
+    const uint32_t before = g_uiObjectCount;
+    const auto load = [&](std::span<const std::byte> bytes) {
+        COrrinStream stream;
+        const bool loaded = LoadBytes(stream, bytes);
+        ASSERT_EQ(loaded, !stream.Record().Failure());
+        ASSERT_LE(stream.Record().Failure().where, bytes.size());
+        ASSERT_TRUE(SurvivesRewriting(stream));
+        for (size_t i = 0; i < stream.GetRootCount(); ++i)
+            use(*stream.GetRoot(i));
+    };
+    for (size_t size = 0; size < whole.size() && !testing::Test::HasFatalFailure(); ++size)
+    {
+        SCOPED_TRACE(size);
+        load(std::span(whole).first(size));
+    }
+    for (const uint32_t word : words)
+    {
+        for (size_t at = 0; at + 4 <= whole.size() && !testing::Test::HasFatalFailure(); ++at)
+        {
+            SCOPED_TRACE(testing::Message() << word << " at " << at);
+            std::vector<std::byte> bytes = whole;
+            std::memcpy(bytes.data() + at, &word, 4);
+            load(bytes);
+        }
+    }
+    EXPECT_EQ(g_uiObjectCount, before);
 }
 
 } // namespace gw

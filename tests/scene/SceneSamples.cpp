@@ -8,21 +8,15 @@
 namespace gw {
 namespace {
 
+// Plain values are told by the documents' test of every class; these matter to links, copies or damage.
 void FillTrack(CKeyframeControl& track)
 {
     track.m_iCycleType = 2;
-    track.m_fFrequency = 0.5f;
-    track.m_fBeginTime = 1.0f;
     track.m_fEndTime = 9.0f;
-    track.m_fPhase = 0.25f;
     track.m_bHasRestMatrix = true;
-    track.m_kRestMatrix.SetTranslation({1, 2, 3});
     track.m_kRotationKeys = {kQuatIdentity, Quat{0, 1, 0, 0}};
     track.m_kPositionKeys = {kVec3One, kVec3UnitX, Vec3{7, 8, 9}};
-    track.m_kScaleKeys = {kVec3One};
-    track.m_kRotationTimes = {1, 2};
     track.m_kPositionTimes = {1, 2, 3};
-    track.m_kScaleTimes = {4};
     track.m_uiParentMask = 0x155;
 }
 
@@ -51,9 +45,6 @@ CCamera* MakeCamera()
 CPointLight* MakeLight()
 {
     CPointLight* light = new CPointLight;
-    light->m_kRGB = {0.25f, 0.5f, 0.75f};
-    light->m_fIntensity = 3.0f;
-    light->m_bLightOn = false;
     light->m_kLocation = {9, 8, 7};
     CLightControl* control = new CLightControl;
     FillKeys(*control);
@@ -105,7 +96,6 @@ Ref<CNode> SampleGraph()
 
     CKeyframeControl* track = new CKeyframeControl;
     FillTrack(*track);
-    track->m_bActive = false;
     track->SetName("CKeyFrameControl");
     root->AttachControl(track);
     root->AttachControl(MakeClips());

@@ -57,8 +57,8 @@ private:
     size_t m_uiType;
 };
 
-/// Returns a graph with one object of each class of the room and no default values: two tracks that share
-/// nothing, a custom data object shared by two nodes, an empty slot, and a target that is not the holder.
+/// Returns a graph with one object of each class of the room: two tracks that share nothing, a custom data
+/// object shared by two nodes, an empty slot, and a target that is not the holder.
 Ref<CNode> SampleGraph();
 
 /// Returns a node with a track whose keys have the given times and positions (time, 0, 0).

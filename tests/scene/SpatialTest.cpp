@@ -22,8 +22,6 @@ std::vector<CObject*> Slots(const CNode& node)
     return slots;
 }
 
-} // namespace
-
 TEST(CNode, ChildrenFillTheFirstEmptySlotAndGrowByTwo)
 {
     const Ref<CNode> node = new CNode;
@@ -142,8 +140,6 @@ TEST(BoundSphere, MergeGrowsJustAsFarAsItMust)
     EXPECT_EQ(BoundOfPoints({}).m_fRadius, 0.0f);
 }
 
-namespace {
-
 class CProbe : public CNode
 {
 public:
@@ -155,8 +151,6 @@ public:
     }
     CRenderState* m_apkTop[kRenderStateTypes] = {};
 };
-
-} // namespace
 
 TEST(CSpatial, UpdateOfALeafRefreshesTheBoundsAboveIt)
 {
@@ -213,4 +207,5 @@ TEST(RenderStates, AFullStackDropsThePushAndAnEmptyOneThePop)
     EXPECT_EQ(stack.Top(1), nullptr);
 }
 
+} // namespace
 } // namespace gw

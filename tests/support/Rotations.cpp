@@ -4,6 +4,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <gtest/gtest.h>
 
 namespace gw {
 namespace {
@@ -25,6 +26,12 @@ double Degrees(double radians)
     return radians * kRadiansToDegrees64;
 }
 
+void ExpectNear(const float* found, const float* expected, int count, double tolerance)
+{
+    for (int i = 0; i < count; ++i)
+        EXPECT_NEAR(found[i], expected[i], tolerance) << "element " << i;
+}
+
 } // namespace
 
 double DegreesBetween(const Mat3& a, const Mat3& b)
@@ -38,6 +45,16 @@ double DegreesBetween(const Quat& a, const Quat& b)
     const float q[] = {b.w, b.x, b.y, b.z};
     const double distance = std::min(SquaredDistance(p, q, 4, 1.0f), SquaredDistance(p, q, 4, -1.0f));
     return Degrees(4.0 * std::asin(std::min(std::sqrt(distance) / 2.0, 1.0)));
+}
+
+void ExpectNear(const Vec3& found, const Vec3& expected, double tolerance)
+{
+    ExpectNear(&found.x, &expected.x, 3, tolerance);
+}
+
+void ExpectNear(const Mat4& found, const Mat4& expected, double tolerance)
+{
+    ExpectNear(found.m, expected.m, 16, tolerance);
 }
 
 } // namespace gw

@@ -1,4 +1,4 @@
-#include "ControlSamples.h"
+#include "MeshSamples.h"
 
 namespace gw {
 namespace {
@@ -78,19 +78,9 @@ CParticles* MakeParticles()
     CParticleControl* control = new CParticleControl;
     particles->AttachControl(control);
     control->m_uiCapacity = 12;
-    control->m_fGrowth = 0.5f;
-    control->m_kForceDirection = kVec3UnitY;
-    control->m_fForceStrength = 3.0f;
-    control->m_kDirection = {1, 2, 3};
     control->m_fRate = 2.0f;
     control->m_kPlace.Set({-1, 1, 0}, {1, -1, 2});
-    control->m_kVelocity.Set({5, 6, 7}, {8, 9, 10});
-    control->m_afFirstColor = {0.1f, 0.2f, 0.3f, 0.4f};
-    control->m_afSecondColor = {0.5f, 0.6f, 0.7f, 0.8f};
-    control->m_kSpread.Set({0.25f, 0, 0}, {0, 0.5f, 0});
     control->m_fLife = 11.0f;
-    control->m_fSize = 12.0f;
-    control->m_auiFurther = {13, 14, 15, 16};
     return particles;
 }
 
