@@ -2,19 +2,14 @@
 
 #include "AimBones.h"
 #include "AlignMotion.h"
-#include "BoneMeshQueries.h"
-#include "CKeyframeControl.h"
 #include "CMadeBody.h"
-#include "CPoseSampler.h"
 #include "CRetargeter.h"
 #include "Directions.h"
-#include "MotionNode.h"
 #include "Rotations.h"
-#include "Skeleton.h"
 #include "TurnedBones.h"
 
+#include <functional>
 #include <gtest/gtest.h>
-#include <map>
 
 namespace gw {
 namespace {
@@ -36,15 +31,15 @@ public:
     CTarget() : CMadeFigure(kBones)
     {
         for (const MadeBone& bone : kBones)
-            AttachBone(Bone(bone.name), bone.name, 1, 100.0f);
+            AddMesh(bone.name, kVec3UnitY * 100.0f);
         Root().UpdateScene(0.0f, true);
-        for (CNode* node : NodesOf(Root()))
-            m_kRest.emplace(node->GetName(), NormalizedRows(node->m_kWorldMatrix));
     }
-    const Mat3& Rest(const std::string& name) const { return m_kRest.at(name); }
-
-private:
-    std::map<std::string, Mat3> m_kRest;
+    Mat3 World(const std::string& name) const { return NormalizedRows(Bone(name).m_kWorldMatrix); }
+    /// Returns the way to a bone from the one that carries all.
+    Vec3 WayTo(const std::string& name) const
+    {
+        return Bone(name).m_kWorldMatrix.Translation() - Root().m_kWorldMatrix.Translation();
+    }
 };
 
 // Maps all target bones to the source bones with the same names, with rotations that would spoil a
@@ -61,21 +56,7 @@ void FillTable(CRetargeter& table, const CMadeBody& source, const CTarget& targe
     }
 }
 
-CMadeBody HangingArms(std::vector<std::string> without = {})
-{
-    CMadeBody::Telling telling;
-    telling.turn = [](const std::string& joint) {
-        const bool isArm = joint == "LUpperArm" || joint == "LForearm" || joint == "LHand";
-        return isArm ? TurnAbout(kVec3UnitZ, -80.0) : kMat3Identity;
-    };
-    telling.without = std::move(without);
-    return CMadeBody(telling);
-}
-
-// Converts, and compares every bone's rotation from the target's rest pose with the joint's rotation from a
-// T-pose.
-void ExpectBonesFollow(const CMadeBody& told, const CMadeBody& truth, const CTarget& target,
-                       CRetargeter& table)
+void Convert(const CMadeBody& told, const CTarget& target, CRetargeter& table)
 {
     const BodyMotion motion = told.Motion();
     Alignment alignment;
@@ -83,80 +64,76 @@ void ExpectBonesFollow(const CMadeBody& told, const CMadeBody& truth, const CTar
     const AlignedMotion aligned = AlignMotion(motion, alignment);
     AimBones(table, target.Root(), motion, alignment, aligned);
     table.Retarget(0.0f, 39.0f, 0.0f, motion.frequency, {0, 923, 13}, true, false);
-    for (const int frame : {0, 11, 39})
+}
+
+// Every bone's rotation from the target's rest pose is the joint's rotation from a T-pose.
+void ExpectBonesFollow(const CMadeBody& truth, const CTarget& target, int frame)
+{
+    const float time = static_cast<float>(frame) / truth.Motion().frequency;
+    const CTarget rest;
+    truth.Motion().root->UpdateScene(time, true);
+    target.Root().UpdateScene(time, true);
+    for (const MadeBone& bone : kBones)
     {
-        const float time = static_cast<float>(frame) / motion.frequency;
-        truth.Motion().root->UpdateScene(time, true);
-        target.Root().UpdateScene(time, true);
-        for (const MadeBone& bone : kBones)
-        {
-            if (!truth.HasJoint(bone.name) || !told.HasJoint(bone.name))
-                continue;
-            const Mat3 turned = NormalizedRows(target.Bone(bone.name).m_kWorldMatrix);
-            const Mat3 meant = target.Rest(bone.name) * NormalizedRows(truth.Joint(bone.name).m_kWorldMatrix);
-            EXPECT_LT(DegreesBetween(turned, meant), 0.2) << bone.name << " at frame " << frame;
-        }
+        if (!truth.HasJoint(bone.name))
+            continue;
+        const Mat3 meant = rest.World(bone.name) * NormalizedRows(truth.Joint(bone.name).m_kWorldMatrix);
+        EXPECT_LT(DegreesBetween(target.World(bone.name), meant), 0.2) << bone.name << " at " << frame;
     }
 }
 
 TEST(AimBones, LetsEveryBonePointAsItsSource)
 {
-    const CMadeBody told = HangingArms();
-    const CTarget target;
-    CRetargeter table;
-    FillTable(table, told, target);
-    ExpectBonesFollow(told, CMadeBody{{}}, target, table);
-}
-
-TEST(AimBones, TakesTheSpineWhereACollarDrivesTheTorso)
-{
-    const CMadeBody told = HangingArms();
-    const CTarget target;
-    CRetargeter table;
-    FillTable(table, told, target);
-    table.SetSourceOf(&target.Bone("UpperTorso"), &told.Joint("LCollar"));
-    table.SetSourceOf(&target.Bone("Waist"), nullptr);
-    table.SetFixed(&target.Bone("Waist"), true);
-    ExpectBonesFollow(told, CMadeBody{{}}, target, table);
-}
-
-TEST(AimBones, KeepsACollarWithoutSourceAtTheTorso)
-{
-    const CMadeBody told = HangingArms();
-    const CTarget target;
-    CRetargeter table;
-    FillTable(table, told, target);
-    table.SetSourceOf(&target.Bone("LCollar"), nullptr);
-    ExpectBonesFollow(told, CMadeBody{{}}, target, table);
+    const CMadeBody told({.turn = ArmsDown(80.0)});
+    const CMadeBody truth{{}};
+    const struct
+    {
+        const char* what;
+        std::function<void(CRetargeter&, const CTarget&)> change;
+    } rows[] = {
+        {"whatever the rows turn", [](CRetargeter&, const CTarget&) {}},
+        {"by the spine where a collar drives the torso",
+         [&](CRetargeter& table, const CTarget& target) {
+             table.SetSourceOf(&target.Bone("UpperTorso"), &told.Joint("LCollar"));
+             table.SetSourceOf(&target.Bone("Waist"), nullptr);
+             table.SetFixed(&target.Bone("Waist"), true);
+         }},
+        {"with the torso if it is a collar without source",
+         [](CRetargeter& table, const CTarget& target) {
+             table.SetSourceOf(&target.Bone("LCollar"), nullptr);
+         }},
+    };
+    for (const auto& [what, change] : rows)
+    {
+        SCOPED_TRACE(what);
+        const CTarget target;
+        CRetargeter table;
+        FillTable(table, told, target);
+        change(table, target);
+        Convert(told, target, table);
+        for (const int frame : {0, 11, 39})
+            ExpectBonesFollow(truth, target, frame);
+    }
 }
 
 TEST(AimBones, HangsLegsOnThePelvisHoweverTheSpineLeans)
 {
-    CMadeBody told = HangingArms();
-    auto& waist = static_cast<CKeyframeControl&>(*told.Joint("Waist").GetControl());
+    const CMadeBody told({.turn = ArmsDown(80.0)});
+    CKeyframeControl& waist = told.Track("Waist");
     waist.m_kRestMatrix.SetTranslation({0, 10, -6});
     waist.m_kPositionKeys.assign(waist.m_kPositionKeys.size(), {0, 10, -6});
     const CTarget target;
     CRetargeter table;
     FillTable(table, told, target);
-    const BodyMotion motion = told.Motion();
-    Alignment alignment;
-    ASSERT_TRUE(PlanAlignment(motion, alignment));
-    const AlignedMotion aligned = AlignMotion(motion, alignment);
-    AimBones(table, target.Root(), motion, alignment, aligned);
-    table.Retarget(0.0f, 39.0f, 0.0f, motion.frequency, {0, 923, 13}, true, false);
+    Convert(told, target, table);
     target.Root().UpdateScene(0.0f, true);
-    const Vec3 spine = target.Bone("Waist").m_kWorldMatrix.Translation() -
-                       target.Bone("LowerTorso").m_kWorldMatrix.Translation();
-    EXPECT_LT(AngleBetween(spine, {0, 10, -6}), 0.1);
-    const Vec3 thigh = target.Bone("LThigh").m_kWorldMatrix.Translation() -
-                       target.Bone("LowerTorso").m_kWorldMatrix.Translation();
-    EXPECT_LT(Vec3Length(thigh - Vec3{95, -138, 0}), 0.1);
+    EXPECT_LT(AngleBetween(target.WayTo("Waist"), {0, 10, -6}), 0.1);
+    EXPECT_LT(Vec3Length(target.WayTo("LThigh") - Vec3{95, -138, 0}), 0.1);
 }
 
 TEST(FindTurnedBones, NamesLimbsThatRowsTurnAtRest)
 {
-    const CMadeBody hanging = HangingArms();
+    const CMadeBody hanging({.turn = ArmsDown(80.0)});
     const CMadeBody straight{{}};
     const CTarget target;
     const auto names = [&](const CMadeBody& source, bool spoil) {

@@ -1,13 +1,8 @@
 #include "CMadeBody.h"
 
-#include "BodyTree.h"
-#include "BoneMeshQueries.h"
-#include "CBoneMesh.h"
-#include "CPoseSampler.h"
 #include "Directions.h"
-#include "MotionNode.h"
+#include "FindBodyByNames.h"
 #include "Skeleton.h"
-#include "TKBVHStream.h"
 
 #include <algorithm>
 #include <cmath>
@@ -99,43 +94,35 @@ CMadeBody::CMadeBody(const Telling& telling) : m_iFrames(telling.frameCount)
         },
         kFrequency);
     for (const std::string& name : m_kNames)
-        AddMesh(name, telling);
+        m_kFigure.AddMesh(name, Turned(name == "RHand" ? kHandEnd : Vec3{0, 5, 0}, telling.turn(name)));
     m_kFigure.Root().UpdateScene(0.0f, true);
 }
 
-// As the reader of BVH files creates it.
-void CMadeBody::AddMesh(const std::string& name, const Telling& telling)
+CKeyframeControl& CMadeBody::Track(const std::string& name) const
 {
-    CNode& node = Joint(name);
-    std::vector<Vec3> children;
-    for (const CNode* child : ChildNodes(node))
-        children.push_back(RestLocal(*child).Translation());
-    if (children.empty())
-        children.push_back(Turned(name == "RHand" ? kHandEnd : Vec3{0, 5, 0}, telling.turn(name)));
-    CBoneMesh& mesh = AttachBone(node, name, children.size(), 1.0f);
-    mesh.m_kEnd = node.HasNoNodeChild() ? children[0] : kVec3Zero;
-    if (children.size() == 1)
-        mesh.m_kMatrix = Mat4Compose(BoneTurn(children[0]), kVec3Zero);
+    return static_cast<CKeyframeControl&>(*Joint(name).GetControl());
 }
 
 BodyMotion CMadeBody::Motion() const
 {
-    const auto joint = [this](const std::string& name) { return HasJoint(name) ? &Joint(name) : nullptr; };
-    BodyMotion motion{&m_kFigure.Root(), kFrequency, m_iFrames, {}};
-    CBodyMap& body = motion.body;
-    body.hip = joint("LowerTorso");
-    body.spine = {joint("Waist"), joint("UpperTorso")};
-    if (HasJoint("Neck"))
-        body.neck = {joint("Neck")};
-    body.head = joint("Head");
-    for (const EBodySide side : kBodySides)
-    {
-        const std::string s = side == EBodySide::Left ? "L" : "R";
-        body.Arm(side) = {joint(s + "Collar"), joint(s + "UpperArm"), joint(s + "Forearm"),
-                          joint(s + "Hand")};
-        body.Leg(side) = {joint(s + "Thigh"), joint(s + "Calf"), joint(s + "Foot"), joint(s + "Toe")};
-    }
-    return motion;
+    CBodyMap body = FindBodyByNames(m_kFigure.Root());
+    if (!HasJoint("Neck")) // names of a spine say nothing without it
+        body.spine = {&Joint("Waist"), &Joint("UpperTorso")};
+    return {&m_kFigure.Root(), kFrequency, m_iFrames, body};
+}
+
+bool IsOneOf(const std::string& joint, std::initializer_list<const char*> parts)
+{
+    return std::ranges::any_of(parts, [&](const char* part) { return joint.substr(1) == part; });
+}
+
+CMadeBody::Turn ArmsDown(double degrees)
+{
+    return [=](const std::string& joint) {
+        const bool isArm =
+            IsOneOf(joint, {"UpperArm", "Forearm", "Hand", "Thumb", "Index", "Middle", "Little"});
+        return isArm ? TurnAbout(kVec3UnitZ, joint[0] == 'L' ? -degrees : degrees) : kMat3Identity;
+    };
 }
 
 std::vector<Mat4> WorldsAt(CNode& root, float frequency, int frame)

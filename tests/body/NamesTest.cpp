@@ -1,5 +1,7 @@
 #include "BodyJoints.h"
+#include "CNamedBody.h"
 #include "FindBodyByNames.h"
+#include "MotionNode.h"
 #include "Skeleton.h"
 #include "Text.h"
 
@@ -11,17 +13,13 @@
 namespace gw {
 namespace {
 
-// A body whose legs are attached to helpers with a side letter. The naming conventions of other programs are
-// tested with their profiles.
-constexpr std::string_view kBody = "Hips(LHipJoint(LeftUpLeg(LeftLeg(LeftFoot(LeftToeBase)))) "
-                                   "RHipJoint(RightUpLeg(RightLeg(RightFoot(RightToeBase)))) "
-                                   "LowerBack(Spine(Spine1(LeftShoulder(LeftArm(LeftForeArm(LeftHand))) "
-                                   "RightShoulder(RightArm(RightForeArm(RightHand))) "
-                                   "Neck(Neck1(Head))))))";
-constexpr const char* kPlaces =
-    "Hips Spine1 Neck Head LeftShoulder LeftArm LeftForeArm LeftHand RightShoulder RightArm RightForeArm "
-    "RightHand "
-    "LeftUpLeg LeftLeg LeftFoot LeftToeBase RightUpLeg RightLeg RightFoot RightToeBase ";
+// Its legs are attached to helpers with a side letter.
+constexpr Convention kHelpers{"cmu-mb",
+                              "Left Right",
+                              "Hips LowerBack Spine Spine1",
+                              "Neck Neck1 Head",
+                              "*Shoulder *Arm *ForeArm *Hand",
+                              "+HipJoint *UpLeg *Leg *Foot *ToeBase"};
 // Other things that can be attached to joints.
 constexpr std::pair<const char*, const char*> kExtras[] = {
     {"LeftHand", "LeftHand_End LeftInHandIndex LeftHandThumb1 LeftHandMiddle1 Props_LeftArm"},
@@ -36,14 +34,6 @@ std::string NameOf(const CNode* node)
     return node ? node->GetName() : "(none)";
 }
 
-std::string NamesOf(const std::vector<CNode*>& nodes)
-{
-    std::string names;
-    for (const CNode* node : nodes)
-        names += NameOf(node) + ' ';
-    return names;
-}
-
 // Builds a tree from text: "Hips(Spine(Head) LeftLeg)".
 Ref<CNode> Tree(std::string_view text)
 {
@@ -55,12 +45,8 @@ Ref<CNode> Tree(std::string_view text)
         const size_t length = text.find_first_of("() ");
         if (length > 0)
         {
-            last = new CNode;
+            last = open ? &AttachNode(*open) : (root = new CNode).Get();
             last->SetName(std::string(text.substr(0, length)).c_str());
-            if (open)
-                open->AttachChild(last);
-            else
-                root = last;
         }
         text.remove_prefix(std::min(length, text.size()));
         if (text.starts_with('('))
@@ -74,73 +60,45 @@ Ref<CNode> Tree(std::string_view text)
 
 TEST(FindBodyByNames, ABodyKeepsItsJointsWhateverIsDoneToItsNames)
 {
-    enum ELetters
-    {
-        AsTheyAre,
-        Upper,
-        Lower,
+    const BodyChange changes[] = {
+        {"as it is"},
+        {"a namespace", "Skeleton 002:"},
+        {"a prefix with an underscore", "Model_"},
+        {"a prefix with a dash", "DEF-"},
+        {"a prefix and nothing behind it", "mixamorig"},
+        {"two prefixes", "J_Bip_"},
+        {"capital letters", "", BodyChange::Upper},
+        {"small letters", "", BodyChange::Lower},
+        {"fingers, twists and ends", "", BodyChange::AsTheyAre, true, true},
+        {"fingers, twists and ends with a prefix", "avg_", BodyChange::AsTheyAre, true, true},
     };
-    const struct
+    for (const BodyChange& change : changes)
     {
-        const char* what;
-        const char* prefix;
-        ELetters letters;
-        bool extras;
-    } rows[] = {
-        {"as it is", "", AsTheyAre, false},
-        {"a namespace", "Skeleton 002:", AsTheyAre, false},
-        {"a prefix with an underscore", "Model_", AsTheyAre, false},
-        {"a prefix with a dash", "DEF-", AsTheyAre, false},
-        {"a prefix and nothing behind it", "mixamorig", AsTheyAre, false},
-        {"two prefixes", "J_Bip_", AsTheyAre, false},
-        {"capital letters", "", Upper, false},
-        {"small letters", "", Lower, false},
-        {"fingers, twists and ends", "", AsTheyAre, true},
-        {"fingers, twists and ends with a prefix", "avg_", AsTheyAre, true},
-    };
-    for (const auto& row : rows)
-    {
-        SCOPED_TRACE(row.what);
-        const Ref<CNode> root = Tree(kBody);
+        const CNamedBody body(kHelpers, change);
         for (const auto& [joint, names] : kExtras)
         {
-            for (std::string_view list = names; row.extras && !list.empty();)
+            for (std::string_view list = names; change.fingers && !list.empty();)
             {
-                auto* const node = new CNode;
-                node->SetName(std::string(NextToken(list, " ")).c_str());
-                FindNode(root.Get(), joint)->AttachChild(node);
+                CNode& extra =
+                    AttachNode(*FindNode(&body.Root(), (std::string(change.prefix) + joint).c_str()));
+                extra.SetName((change.prefix + std::string(NextToken(list, " "))).c_str());
             }
         }
-        const auto rename = [&](std::string_view name) {
-            const std::string whole = row.prefix + std::string(name);
-            return row.letters == Upper ? UpperCase(whole) : row.letters == Lower ? LowerCase(whole) : whole;
-        };
-        for (CNode* node : NodesOf(*root))
-            node->SetName(rename(node->NameView()).c_str());
-        const CBodyMap body = FindBodyByNames(*root);
-        std::string_view places = kPlaces;
-        for (const BodyPlace& place : BodyPlaces())
-            EXPECT_EQ(NameOf(JointAt(body, place)), rename(NextToken(places, " ")));
-        EXPECT_EQ(NamesOf(body.spine),
-                  rename("LowerBack") + ' ' + rename("Spine") + ' ' + rename("Spine1") + ' ');
-        EXPECT_EQ(NamesOf(body.neck), rename("Neck") + ' ' + rename("Neck1") + ' ');
+        EXPECT_TRUE(FindBodyByNames(body.Root()) == body.Body()) << change.what;
     }
 }
 
 TEST(FindBodyByNames, APrefixMayStandBeforeHalfOfTheNames)
 {
-    const Ref<CNode> root = Tree(kBody);
+    const CNamedBody body(kHelpers, {"as it is"});
     bool every2nd = false;
-    for (CNode* node : NodesOf(*root))
+    for (CNode* node : NodesOf(body.Root()))
     {
         every2nd = !every2nd;
         if (every2nd)
             node->SetName(("mixamorig" + std::string(node->NameView())).c_str());
     }
-    const CBodyMap body = FindBodyByNames(*root);
-    std::string_view places = kPlaces;
-    for (const BodyPlace& place : BodyPlaces())
-        EXPECT_TRUE(NameOf(JointAt(body, place)).ends_with(NextToken(places, " ")));
+    EXPECT_TRUE(FindBodyByNames(body.Root()) == body.Body());
 }
 
 TEST(FindBodyByNames, WordsAreUnderstoodInTheirCompany)

@@ -1,11 +1,12 @@
 #include "MadeWalk.h"
 
 #include "Angles.h"
-#include "CMadeText.h"
+#include "MadeText.h"
 
 #include <algorithm>
 #include <cmath>
 #include <gtest/gtest.h>
+#include <span>
 #include <vector>
 
 namespace gw {
@@ -19,24 +20,35 @@ constexpr float kHipHeight = 90.0f;
 struct JointRow
 {
     const char* name;
-    int depth;
+    const char* parent;
     Vec3 offset;  // cm
     double turn;  // in degrees about X at the end of a swing
     double onset; // fraction of the stride
 };
 
 constexpr JointRow kJoints[] = {
-    {"Hips", 0, {0.0f, 0.0f, 0.0f}, 0.0, 0.0},           {"LeftUpLeg", 1, {9.0f, -2.0f, 0.0f}, kSwing, 0.0},
-    {"LeftLeg", 2, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},      {"LeftFoot", 3, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},
-    {"LeftToeBase", 4, {0.0f, -5.0f, 14.0f}, 0.0, 0.0},  {"RightUpLeg", 1, {-9.0f, -2.0f, 0.0f}, kSwing, 0.5},
-    {"RightLeg", 2, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},     {"RightFoot", 3, {0.0f, -41.0f, 0.0f}, 0.0, 0.0},
-    {"RightToeBase", 4, {0.0f, -5.0f, 14.0f}, 0.0, 0.0}, {"Spine", 1, {0.0f, 10.0f, 0.0f}, 2.0, 0.0},
-    {"Spine1", 2, {0.0f, 20.0f, 0.0f}, 2.0, 0.3},        {"LeftShoulder", 3, {4.0f, 18.0f, 0.0f}, 1.0, 0.1},
-    {"LeftArm", 4, {13.0f, 0.0f, 0.0f}, 9.0, 0.5},       {"LeftForeArm", 5, {27.0f, 0.0f, 0.0f}, 3.0, 0.6},
-    {"LeftHand", 6, {25.0f, 0.0f, 0.0f}, 2.0, 0.7},      {"RightShoulder", 3, {-4.0f, 18.0f, 0.0f}, 1.0, 0.6},
-    {"RightArm", 4, {-13.0f, 0.0f, 0.0f}, 9.0, 0.0},     {"RightForeArm", 5, {-27.0f, 0.0f, 0.0f}, 3.0, 0.1},
-    {"RightHand", 6, {-25.0f, 0.0f, 0.0f}, 2.0, 0.2},    {"Neck", 3, {0.0f, 22.0f, 0.0f}, 1.0, 0.4},
-    {"Head", 4, {0.0f, 10.0f, 1.0f}, 1.0, 0.8},
+    {"Reference", "", {0, 0, 0}, 0, 0},
+    {"Hips", "Reference", {0, 0, 0}, 0, 0},
+    {"LeftUpLeg", "Hips", {9, -2, 0}, kSwing, 0},
+    {"LeftLeg", "LeftUpLeg", {0, -41, 0}, 0, 0},
+    {"LeftFoot", "LeftLeg", {0, -41, 0}, 0, 0},
+    {"LeftToeBase", "LeftFoot", {0, -5, 14}, 0, 0},
+    {"RightUpLeg", "Hips", {-9, -2, 0}, kSwing, 0.5},
+    {"RightLeg", "RightUpLeg", {0, -41, 0}, 0, 0},
+    {"RightFoot", "RightLeg", {0, -41, 0}, 0, 0},
+    {"RightToeBase", "RightFoot", {0, -5, 14}, 0, 0},
+    {"Spine", "Hips", {0, 10, 0}, 2, 0},
+    {"Spine1", "Spine", {0, 20, 0}, 2, 0.3},
+    {"LeftShoulder", "Spine1", {4, 18, 0}, 1, 0.1},
+    {"LeftArm", "LeftShoulder", {13, 0, 0}, 9, 0.5},
+    {"LeftForeArm", "LeftArm", {27, 0, 0}, 3, 0.6},
+    {"LeftHand", "LeftForeArm", {25, 0, 0}, 2, 0.7},
+    {"RightShoulder", "Spine1", {-4, 18, 0}, 1, 0.6},
+    {"RightArm", "RightShoulder", {-13, 0, 0}, 9, 0},
+    {"RightForeArm", "RightArm", {-27, 0, 0}, 3, 0.1},
+    {"RightHand", "RightForeArm", {-25, 0, 0}, 2, 0.2},
+    {"Neck", "Spine1", {0, 22, 0}, 1, 0.4},
+    {"Head", "Neck", {0, 10, 1}, 1, 0.8},
 };
 
 // A leg swings at constant speed, so that the foot on the ground stands while the hip moves on.
@@ -54,9 +66,7 @@ Vec3 HipAt(double seconds)
 std::vector<JointRow> JointsOf(const WalkStyle& style)
 {
     std::vector<JointRow> joints;
-    if (style.rootBelow)
-        joints.push_back({"Reference", -1, kVec3Zero, 0.0, 0.0});
-    for (const JointRow& joint : kJoints)
+    for (const JointRow& joint : std::span(kJoints).subspan(style.rootBelow ? 0 : 1))
     {
         if (style.toes || !std::string_view(joint.name).ends_with("ToeBase"))
             joints.push_back(joint);
@@ -66,21 +76,25 @@ std::vector<JointRow> JointsOf(const WalkStyle& style)
     return joints;
 }
 
-// Returns where a line starts; the end of the text for a line after the last one.
-size_t BeginOf(std::string_view text, size_t number)
+// Returns where a part of a text begins, counted from 0; the end of the text behind its last part.
+size_t BeginOf(std::string_view text, char separator, size_t part)
 {
     size_t at = 0;
-    for (; number > 1 && at < text.size(); --number)
-        at = std::min(text.find('\n', at), text.size() - 1) + 1;
+    for (; part > 0 && at < text.size(); --part)
+        at = std::min(text.find(separator, at), text.size() - 1) + 1;
     return at;
 }
 
-size_t BeginOfValue(std::string_view row, size_t column)
+std::string PartOf(std::string_view text, char separator, size_t part)
 {
-    size_t begin = 0;
-    for (; column > 0; --column)
-        begin = row.find(' ', begin) + 1;
-    return begin;
+    const size_t begin = BeginOf(text, separator, part);
+    return std::string(text.substr(begin, text.find(separator, begin) - begin));
+}
+
+std::string WithPart(std::string_view text, char separator, size_t part, std::string_view instead)
+{
+    const size_t length = PartOf(text, separator, part).size();
+    return std::string(text).replace(BeginOf(text, separator, part), length, instead);
 }
 
 } // namespace
@@ -92,13 +106,11 @@ std::string MadeWalk(const WalkStyle& style)
     std::vector<TextJoint> joints;
     for (const JointRow& row : rows)
     {
-        // The closest earlier joint that is one level higher.
-        const auto isAbove = [&](const JointRow& other) { return other.depth == row.depth - 1; };
-        const auto above =
-            std::find_if(rows.rend() - static_cast<ptrdiff_t>(joints.size()), rows.rend(), isAbove);
-        joints.push_back({row.name, static_cast<int>(rows.rend() - above) - 1, written(row.offset),
-                          written({0.0f, 6.0f, 0.0f}),
-                          row.depth == 0 || style.sixChannels || style.repeatsOffsets});
+        const auto above = std::ranges::find(rows, std::string_view(row.parent), &JointRow::name);
+        const bool isHip = row.name == std::string_view("Hips");
+        joints.push_back({row.name, above == rows.end() ? -1 : static_cast<int>(above - rows.begin()),
+                          written(row.offset), written({0.0f, 6.0f, 0.0f}),
+                          isHip || style.sixChannels || style.repeatsOffsets});
     }
     const auto key = [&](size_t joint, int frame) {
         const JointRow& row = rows[joint];
@@ -108,9 +120,7 @@ std::string MadeWalk(const WalkStyle& style)
         const double turn = row.turn * Wave(seconds / kStrideSeconds + row.onset);
         return TextKey{written(position), {static_cast<float>(turn), 0.0f, 0.0f}};
     };
-    CMadeText text(std::move(joints));
-    text.m_bScientific = style.scientific;
-    return text.Write(style.frames, 1.0 / style.declaredRate, key);
+    return MadeText(joints, style.frames, 1.0 / style.declaredRate, key);
 }
 
 std::string Replaced(std::string text, std::string_view part, std::string_view instead,
@@ -139,26 +149,27 @@ size_t LineOfFrame(std::string_view text, int frame)
 
 std::string LineOf(std::string_view text, size_t number)
 {
-    const size_t begin = BeginOf(text, number);
-    return std::string(text.substr(begin, text.find('\n', begin) - begin));
+    return PartOf(text, '\n', number - 1);
 }
 
 std::string WithLine(std::string_view text, size_t number, std::string_view line)
 {
-    const size_t begin = BeginOf(text, number);
-    return std::string(text).replace(begin, LineOf(text, number).size(), line);
-}
-
-std::string WithValue(std::string_view row, size_t column, std::string_view value)
-{
-    const size_t begin = BeginOfValue(row, column);
-    return std::string(row).replace(begin, row.find(' ', begin) - begin, value);
+    return WithPart(text, '\n', number - 1, line);
 }
 
 double ValueOf(std::string_view text, int frame, size_t column)
 {
-    const std::string row = LineOf(text, LineOfFrame(text, frame));
-    return std::stod(row.substr(BeginOfValue(row, column)));
+    return std::stod(PartOf(LineOf(text, LineOfFrame(text, frame)), ' ', column));
+}
+
+std::string WithValues(std::string text, int frame, size_t column, const std::vector<const char*>& values)
+{
+    for (const char* value : values)
+    {
+        const size_t line = LineOfFrame(text, frame++);
+        text = WithLine(text, line, WithPart(LineOf(text, line), ' ', column, value));
+    }
+    return text;
 }
 
 } // namespace gw

@@ -2,6 +2,7 @@
 
 #include <string>
 #include <string_view>
+#include <vector>
 
 namespace gw {
 
@@ -18,8 +19,7 @@ struct WalkStyle
     bool repeatsOffsets = false; ///< positions on every joint, repeating the offsets
     /// the root's offset contains the hip's height, which its channels contain too
     bool hipOffset = false;
-    bool rootBelow = false;  ///< a root "Reference" above the hip
-    bool scientific = false; ///< numbers like 9.0000000e+01
+    bool rootBelow = false; ///< a root "Reference" above the hip
 };
 
 /// Returns a person who walks 0.69 m per step, as the text of a correct BVH file.
@@ -38,7 +38,7 @@ std::string WithLine(std::string_view text, size_t number, std::string_view line
 std::string LineOf(std::string_view text, size_t number);
 /// Returns the value in a column of a frame's row.
 double ValueOf(std::string_view text, int frame, size_t column);
-/// Returns a row with a new value in a column.
-std::string WithValue(std::string_view row, size_t column, std::string_view value);
+/// Returns a text with new values in a column, one a frame from a frame on.
+std::string WithValues(std::string text, int frame, size_t column, const std::vector<const char*>& values);
 
 } // namespace gw

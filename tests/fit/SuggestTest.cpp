@@ -1,5 +1,6 @@
 #include "Angles.h"
 #include "ApplyRow.h"
+#include "BodyJoints.h"
 #include "BoneOffset.h"
 #include "CMadeSkeleton.h"
 #include "CRetargeter.h"
@@ -62,7 +63,7 @@ ConversionMeasures Measure(const CMotionFile& source, const CMapRowTable& rows)
     return MeasureConversion(ClipOf(source), ClipOf(*result), pairs);
 }
 
-TEST(SuggestProfile, EveryMadeSkeletonPointsAsItsSourceAtRest)
+TEST(SuggestProfile, EveryMadeSkeletonPointsAsItsSourceAtRestAndInEveryFrame)
 {
     for (const std::string& recipe : SkeletonRecipes())
     {
@@ -92,22 +93,10 @@ TEST(SuggestProfile, EveryMadeSkeletonPointsAsItsSourceAtRest)
         }
         EXPECT_GE(count, 8);
         EXPECT_LT(sum / count, 0.5 + 0.5 * share);
-    }
-}
-
-TEST(SuggestProfile, BonesThatAreRigidFollowInEveryFrame)
-{
-    for (const char* recipe : {"walk fingers", "nopose walk", "walk zup turned apose"})
-    {
-        SCOPED_TRACE(recipe);
-        const CMadeSkeleton made(recipe, 2);
-        const auto target = LoadTarget();
-        const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
-        const ConversionMeasures measures = Measure(made.Motion(), profile.Table());
-        for (const BoneMeasures& bone : measures.bones)
+        for (const BoneMeasures& bone : Measure(made.Motion(), table).bones)
         {
             const bool isTurned = RowOf(profile, bone.target).kind == ESuggestedRow::Turned;
-            EXPECT_TRUE(!bone.measured || !isTurned || bone.largestError < 1.0) << bone.target;
+            EXPECT_TRUE(!bone.measured || !isTurned || bone.largestError < 1.0 + share) << bone.target;
         }
     }
 }
@@ -158,11 +147,10 @@ TEST(SuggestProfile, RowsGoWithWhatTheSkeletonHas)
 TEST(SuggestProfile, SaysWhatItIsUnsureOf)
 {
     const auto target = LoadTarget();
-    const CMadeSkeleton clear("", 1);
-    const SuggestedProfile byShape = SuggestProfile(clear.Root(), *target->motionRoot);
+    const SuggestedProfile byShape = SuggestProfile(CMadeSkeleton("", 1).Root(), *target->motionRoot);
     EXPECT_EQ(RowOf(byShape, "LThigh").sureness, ERowSureness::Likely);
-    const CMadeSkeleton blind("notoes bare", 1);
-    const SuggestedProfile guessed = SuggestProfile(blind.Root(), *target->motionRoot);
+    const SuggestedProfile guessed =
+        SuggestProfile(CMadeSkeleton("notoes bare", 1).Root(), *target->motionRoot);
     EXPECT_FALSE(guessed.sidesAreSure);
     EXPECT_EQ(RowOf(guessed, "LThigh").sureness, ERowSureness::Unsure);
     EXPECT_EQ(RowOf(guessed, "Head").sureness, ERowSureness::Likely);
@@ -177,7 +165,7 @@ TEST(SuggestProfile, NamesThatAProfileCannotHoldAreLeftOut)
         const CMadeSkeleton made("", 1);
         made.Root().SetName("Hips"); // otherwise the last name would be used for the hip
         const BodyPlace place{EBodyJoint::UpperArm, EBodySide::Right};
-        FindBone(&made.Root(), made.NameAt(place))->SetName(name);
+        JointAt(made.Body(), place)->SetName(name);
         const SuggestedProfile profile = SuggestProfile(made.Root(), *target->motionRoot);
         EXPECT_EQ(RowOf(profile, "RUpperArm").kind, ESuggestedRow::NoName);
         EXPECT_EQ(profile.missing, std::vector<BodyPlace>{place});

@@ -8,7 +8,7 @@
 #include <cmath>
 #include <functional>
 #include <gtest/gtest.h>
-#include <random>
+#include <tuple>
 #include <vector>
 
 namespace gw {
@@ -27,7 +27,6 @@ struct Step
     double twist = 0.0; ///< turn that is added over each stand
     double tilt = 0.0;  ///< while it stands
     int early = 0;      ///< frames that it leaves the floor too soon
-    double noise = 0.0;
 };
 
 Vec3 FootAt(const Step& step, int frame)
@@ -42,13 +41,12 @@ Vec3 FootAt(const Step& step, int frame)
             static_cast<float>(step.drift + 600.0 * std::sin(swing * kPi64))};
 }
 
-auto Walking(const Step& step)
+FigurePose Walking(const Step& step)
 {
-    return [step, random = std::mt19937(7)](CMadeFigure& figure, int frame) mutable {
-        std::normal_distribution<float> noise(0.0f, static_cast<float>(std::max(step.noise, 1e-9)));
+    return [=](CMadeFigure& figure, int frame) {
         for (const char* foot : {"LFoot", "RFoot"})
         {
-            figure.Move(foot, FootAt(step, frame) + Vec3{noise(random), noise(random), noise(random)});
+            figure.Move(foot, FootAt(step, frame));
             figure.Turn(foot, kVec3UnitX, frame % kPeriod < kStand ? step.tilt : 20.0);
             const double share = static_cast<double>(frame % kPeriod) / (kStand - 1);
             figure.Turn(foot, kVec3UnitY, step.turn + step.twist * std::min(share, 1.0));
@@ -58,11 +56,7 @@ auto Walking(const Step& step)
 
 ConversionMeasures MeasureWalks(const Step& sourceStep, const Step& resultStep, double sourceUnit = 1.0)
 {
-    CMadeFigure source(sourceUnit);
-    CMadeFigure result;
-    const MotionClip sourceClip = source.Record(kFrames, Walking(sourceStep));
-    const MotionClip resultClip = result.Record(kFrames, Walking(resultStep));
-    return MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+    return PairedFigures(sourceUnit).Measure(Walking(sourceStep), Walking(resultStep), kFrames);
 }
 
 } // namespace
@@ -81,24 +75,6 @@ TEST(MeasureFeet, ContactsAreTheFramesThatStand)
     const double expected = 2.0 * (standing - 8.0) / (standing + standing - 8.0);
     ExpectMeasured(early.contactF1.value_or(0.0), expected);
     EXPECT_EQ(early.feet[0].bothStanding, 3u * (kStand - 8));
-
-    // At 200 mm/s nobody can tell; what is left are the ends of the stands, in which the foot arrives or
-    // leaves.
-    const ConversionMeasures doubtful = MeasureWalks({.drift = 200.0 / 30.0 * (kStand - 1)}, {.early = 8});
-    EXPECT_EQ(doubtful.feet[0].sourceContacts, 3u);
-    EXPECT_EQ(doubtful.feet[0].sourceStanding, 5u);
-    EXPECT_EQ(doubtful.feet[0].bothStanding, 2u);
-}
-
-TEST(MeasureFeet, NoiseMakesNoContacts)
-{
-    const ConversionMeasures noisy = MeasureWalks({.noise = 2.0}, {.noise = 2.0});
-    for (const FootMeasures& foot : noisy.feet)
-    {
-        EXPECT_EQ(foot.sourceContacts, 3u);
-        EXPECT_EQ(foot.resultContacts, 3u);
-        EXPECT_GT(foot.contactF1.value_or(0.0), 0.97);
-    }
 }
 
 // An ankle of a leg of 800 mm: it begins to stand below 48 mm and 280 mm/s, and leaves above 80 mm or 480
@@ -106,82 +82,50 @@ TEST(MeasureFeet, NoiseMakesNoContacts)
 TEST(FindContacts, ThresholdsHaveASlack)
 {
     constexpr int kFrameCount = 60;
-    const struct
-    {
-        const char* what;
-        double rate;
-        std::function<Vec3(int frame)> place;
-        std::vector<int> borders; // first frame and end of each contact
-    } rows[] = {
+    const std::tuple<const char*, double, std::function<Vec3(int)>, std::vector<int>> rows[] = {
         {"it hovers where a stand begins",
          30.0,
-         [](int f) {
-             return Vec3{0.0f, f % 8 < 4 ? 46.0f : 50.0f, 0.0f};
-         },
+         [](int f) { return kVec3UnitY * (f % 8 < 4 ? 46.0f : 50.0f); },
          {0, 60}},
         {"it rises above where one ends",
          30.0,
-         [](int f) {
-             return Vec3{0.0f, f < 20 ? 0.0f : 85.0f, 0.0f};
-         },
+         [](int f) { return kVec3UnitY * (f < 20 ? 0.0f : 85.0f); },
          {0, 20}},
-        {"it hovers too high from the start",
-         30.0,
-         [](int) {
-             return Vec3{0.0f, 60.0f, 0.0f};
-         },
-         {}},
+        {"it hovers too high from the start", 30.0, [](int) { return kVec3UnitY * 60.0f; }, {}},
         {"it drifts faster and faster",
          30.0,
-         [](int f) {
-             return Vec3{0.2f * static_cast<float>(f * f), 0.0f, 0.0f};
-         },
+         [](int f) { return kVec3UnitX * (0.2f * static_cast<float>(f * f)); },
          {0, 41}},
-        {"it brushes the floor",
-         30.0,
-         [](int f) {
-             return Vec3{0.0f, f % 30 < 2 ? 0.0f : 90.0f, 0.0f};
-         },
-         {}},
+        {"it brushes the floor", 30.0, [](int f) { return kVec3UnitY * (f % 30 < 2 ? 0.0f : 90.0f); }, {}},
         {"it taps the floor for a tenth of a second",
          30.0,
-         [](int f) {
-             return Vec3{0.0f, f % 30 < 3 ? 0.0f : 90.0f, 0.0f};
-         },
+         [](int f) { return kVec3UnitY * (f % 30 < 3 ? 0.0f : 90.0f); },
          {0, 3, 30, 33}},
         {"a fast recording shakes",
          120.0,
-         [](int f) {
-             return Vec3{f % 2 == 0 ? 3.0f : -3.0f, 0.0f, 0.0f};
-         },
+         [](int f) { return kVec3UnitX * (f % 2 == 0 ? 3.0f : -3.0f); },
          {0, 60}},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, rate, place, borders] : rows)
     {
-        SCOPED_TRACE(row.what);
+        SCOPED_TRACE(what);
         std::vector<Vec3> places(kFrameCount);
         for (int f = 0; f < kFrameCount; ++f)
-            places[static_cast<size_t>(f)] = row.place(f);
+            places[static_cast<size_t>(f)] = place(f);
         const FloorPath ankle{places, 0.0f};
-        std::vector<int> borders;
-        for (const Contact& contact : FindContacts({&ankle, 1}, 800.0, 1.0 / row.rate))
-            borders.insert(borders.end(), {contact.first, contact.end});
-        EXPECT_EQ(borders, row.borders);
+        std::vector<int> found;
+        for (const Contact& contact : FindContacts({&ankle, 1}, 800.0, 1.0 / rate))
+            found.insert(found.end(), {contact.first, contact.end});
+        EXPECT_EQ(found, borders);
     }
 }
 
 TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
 {
     const double twist = 2.0 * 150.0 * std::sin(5.0 * kDegreesToRadians64); // of the toe, by ten degrees
-    const struct
-    {
-        const char* what;
-        Step source; // of a figure of the result's size
-        Step result;
-        double unit; // of the source
-        double ankle;
-        double toe;
-    } rows[] = {
+    // The source, of a figure of the result's size, and the result; the source's unit; slides of ankle and
+    // toe.
+    const std::tuple<const char*, Step, Step, double, double, double> rows[] = {
         {"the result slides", {}, {.drift = 25.0}, 1.0, 25.0, 25.0},
         {"a source in metres", {}, {.drift = 25.0}, 0.001, 25.0, 25.0},
         {"a source of half the size", {}, {.drift = 25.0}, 0.0005, 25.0, 25.0},
@@ -189,18 +133,18 @@ TEST(MeasureFeet, AddedSlideIsThatOfTheResultInItsOwnLength)
         {"the result slides less", {.drift = 30.0}, {.drift = 5.0}, 0.001, -25.0, -25.0},
         {"the result turns on its heel", {}, {.twist = 10.0}, 0.01, 0.0, twist},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, sourceStep, resultStep, sourceUnit, ankle, toe] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const ConversionMeasures walks = MeasureWalks(row.source, row.result, row.unit);
+        SCOPED_TRACE(what);
+        const ConversionMeasures walks = MeasureWalks(sourceStep, resultStep, sourceUnit);
         for (const FootMeasures& foot : walks.feet)
         {
             EXPECT_EQ(foot.ankleSlide.plants, 3u);
-            ExpectMeasured(foot.ankleSlide.median, row.ankle);
-            ExpectMeasured(foot.ankleSlide.largest, row.ankle);
-            ExpectMeasured(foot.toeSlide.largest, row.toe);
+            ExpectMeasured(foot.ankleSlide.median, ankle);
+            ExpectMeasured(foot.ankleSlide.largest, ankle);
+            ExpectMeasured(foot.toeSlide.largest, toe);
         }
-        ExpectMeasured(walks.toeSlide.median, row.toe);
+        ExpectMeasured(walks.toeSlide.median, toe);
     }
 }
 
@@ -227,26 +171,19 @@ TEST(MeasureFeet, SoleStandsAndSinksByItsDepth)
 
 TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
 {
-    const struct
-    {
-        const char* what;
-        double sourceTurn;
-        double resultTurn;
-        double expected;
-    } rows[] = {
+    const std::tuple<const char*, double, double, double> rows[] = {
         {"out", 0.0, 11.0, 11.0},
         {"in", 0.0, -11.0, -11.0},
         {"both", 30.0, 41.0, 11.0},
         {"over the back of a circle", 175.0, -174.0, 11.0},
     };
-    for (const auto& row : rows)
+    for (const auto& [what, sourceTurn, resultTurn, expected] : rows)
     {
-        SCOPED_TRACE(row.what);
-        const ConversionMeasures walks =
-            MeasureWalks({.turn = row.sourceTurn}, {.turn = row.resultTurn}, 0.01);
+        SCOPED_TRACE(what);
+        const ConversionMeasures walks = MeasureWalks({.turn = sourceTurn}, {.turn = resultTurn}, 0.01);
         for (const FootMeasures& foot : walks.feet)
         {
-            ExpectMeasured(foot.turnMean, row.expected);
+            ExpectMeasured(foot.turnMean, expected);
             ExpectMeasured(foot.turnError, 11.0);
             ExpectMeasured(foot.turnLargest, 11.0);
             ExpectMeasured(foot.turnWhileStanding, 11.0);
@@ -258,17 +195,14 @@ TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)
 // Without a toe joint nobody knows where a foot points; how far it turns is known.
 TEST(MeasureFeet, FootWithoutToeTurnsFromItsStart)
 {
-    CMadeFigure source;
-    source.Remove("LToe");
-    CMadeFigure result;
+    PairedFigures figures;
+    figures.source.Remove("LToe");
     const auto turning = [](double startTurn, double endTurn) {
         return [=](CMadeFigure& figure, int frame) {
             figure.Turn("LFoot", kVec3UnitY, frame < 1 ? startTurn : endTurn);
         };
     };
-    const MotionClip sourceClip = source.Record(200, turning(70.0, 90.0));
-    const MotionClip resultClip = result.Record(200, turning(0.0, 31.0));
-    const ConversionMeasures measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+    const ConversionMeasures measures = figures.Measure(turning(70.0, 90.0), turning(0.0, 31.0), 200);
     ASSERT_EQ(measures.feet.size(), 2u);
     EXPECT_TRUE(measures.feet[0].turnFromStart);
     ExpectMeasured(measures.feet[0].turnMean, 11.0);
@@ -306,13 +240,9 @@ TEST(MeasureFeet, KneePopIsAChangeInTimeThatTheSourceDoesNotMake)
                 figure.Turn("LCalf", kVec3UnitX, degrees * std::clamp((frame - start) / frames, 0.0, 1.0));
             };
         };
-        CMadeFigure source;
-        CMadeFigure result;
-        const float frequency = 1.0f / static_cast<float>(row.rate);
-        const MotionClip sourceClip =
-            source.Record(2 * row.rate, bending(row.sourceDegrees, row.rate - row.framesEarlier), frequency);
-        const MotionClip resultClip = result.Record(2 * row.rate, bending(row.degrees, row.rate), frequency);
-        const auto measures = MeasureConversion(sourceClip, resultClip, PairByName(source, result));
+        const ConversionMeasures measures = PairedFigures().Measure(
+            bending(row.sourceDegrees, row.rate - row.framesEarlier), bending(row.degrees, row.rate),
+            2 * row.rate, 1.0f / static_cast<float>(row.rate));
         EXPECT_EQ(measures.feet[0].kneePops, row.pops);
         EXPECT_NEAR(measures.feet[0].kneePopLargest, row.largest, 0.02);
         EXPECT_EQ(measures.feet[1].kneePops, 0u);

@@ -2,6 +2,7 @@
 
 #include "Skeleton.h"
 
+#include <algorithm>
 #include <cmath>
 #include <gtest/gtest.h>
 
@@ -21,6 +22,20 @@ std::vector<BonePair> PairByName(const CMadeFigure& source, const CMadeFigure& r
             pairs.push_back({target, bone});
     }
     return pairs;
+}
+
+BoneMeasures BoneOf(const ConversionMeasures& measures, std::string_view target)
+{
+    const auto found = std::ranges::find(measures.bones, target, &BoneMeasures::target);
+    return found == measures.bones.end() ? BoneMeasures() : *found;
+}
+
+ConversionMeasures PairedFigures::Measure(const FigurePose& sourcePose, const FigurePose& resultPose,
+                                          int frameCount, float frequency)
+{
+    sourceClip = source.Record(frameCount, sourcePose, frequency);
+    resultClip = result.Record(frameCount, resultPose, frequency);
+    return MeasureConversion(sourceClip, resultClip, PairByName(source, result), &detail);
 }
 
 } // namespace gw

@@ -2,6 +2,7 @@
 
 #include "PreviewScene.h"
 
+#include <algorithm>
 #include <gtest/gtest.h>
 #include <tuple>
 
@@ -75,22 +76,18 @@ TEST(DrawList, AxesFollowTheMeshWithItsScale)
 
 TEST(DrawList, HighlightIsExactlyTheParentsName)
 {
-    const std::tuple<const char*, const char*, bool> rows[] = {
-        {"Hips", "Hips", true},   {"hips", "Hips", false},  {"Hip", "Hips", false},
-        {"Hips2", "Hips", false}, {"mesh", "Hips", false},  {"scene", "Hips", false},
-        {"", "", false},          {"Hips", nullptr, false}, {"", nullptr, false},
-    };
-    for (const auto& [highlight, parent, shines] : rows)
+    const Ref<CNode> scene = MakeScene({});
+    scene->SetName("scene");
+    const char* const nameless = nullptr;
+    for (const char* name : {"Hips", "other", "", nameless})
+        AttachBone(*scene, name, 1).SetName("mesh");
+    for (const std::string highlight : {"Hips", "hips", "Hip", "Hips2", "mesh", "scene", ""})
     {
-        SCOPED_TRACE(highlight);
-        const Ref<CNode> scene = MakeScene({});
-        scene->SetName("scene");
-        AttachBone(*scene, parent, 1).SetName("mesh");
-        AttachBone(*scene, "other", 1);
-        const std::vector<LineEnd> lines = LinesOf(*scene, highlight);
-        ASSERT_EQ(lines.size(), 2 * (kAxisEnds + 6));
-        EXPECT_EQ(lines[kAxisEnds].color, shines ? kHighlightColor : kBoneColor);
-        EXPECT_EQ(lines.back().color, kBoneColor);
+        const std::vector<LineEnd> lines = LinesOf(*scene, highlight.c_str());
+        ASSERT_EQ(lines.size(), 4 * (kAxisEnds + 6));
+        const bool shines = highlight == "Hips";
+        EXPECT_EQ(lines[kAxisEnds].color, shines ? kHighlightColor : kBoneColor) << highlight;
+        EXPECT_EQ(std::ranges::count(lines, kHighlightColor, &LineEnd::color), shines ? 6 : 0) << highlight;
     }
 }
 

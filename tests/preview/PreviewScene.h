@@ -3,6 +3,7 @@
 #include "CControl.h"
 #include "CGLView.h"
 #include "CTriMesh.h"
+#include "RgbPicture.h"
 
 #include <vector>
 
@@ -29,6 +30,35 @@ CTimeKeeper& AttachKeeper(CNode& root);
 /// Attaches a named bone to a node, at a position, and a mesh to the bone. The mesh has separate triangles,
 /// the i-th one moved by i along Z.
 CTriMesh& AttachBone(CNode& parent, const char* name, int32_t triangles, const Vec3& place = kVec3Zero);
+
+/// Part of a picture, between the first two and the last two numbers.
+struct PixelArea
+{
+    int left;
+    int top;
+    int right;
+    int bottom;
+};
+
+/// Returns the number of pixels in an area with exactly this color.
+inline int CountColor(const RgbPicture& picture, LineColor color, const PixelArea& area)
+{
+    int count = 0;
+    for (int y = area.top; y < area.bottom; ++y)
+    {
+        for (int x = area.left; x < area.right; ++x)
+        {
+            const uint8_t* const pixel = picture.Pixel(x, y);
+            count += LineColor{pixel[0], pixel[1], pixel[2]} == color ? 1 : 0;
+        }
+    }
+    return count;
+}
+
+inline int CountColor(const RgbPicture& picture, LineColor color)
+{
+    return CountColor(picture, color, {0, 0, picture.width, picture.height});
+}
 
 /// A view that counts its repaint requests.
 class CCountedView : public CGLView

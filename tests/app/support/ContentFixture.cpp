@@ -1,8 +1,8 @@
 #include "ContentFixture.h"
 
 #include "CKeyframeControl.h"
-#include "CMadeText.h"
 #include "COrrinStream.h"
+#include "MadeText.h"
 #include "Paths.h"
 #include "Text.h"
 
@@ -160,14 +160,14 @@ std::string TargetText()
 std::string BvhText(const SourceBones& bones, int frameCount)
 {
     const Vec3 toe{0.0f, -4.0f, 12.0f};
-    CMadeText text({{bones.hip, -1, kVec3Zero},
-                    {bones.leftThigh, 0, {9, -4, 0}},
-                    {bones.leftCalf, 1, {0, -40, 0}},
-                    {bones.leftFoot, 2, {0, -38, 0}, toe},
-                    {bones.rightThigh, 0, {-9, -4, 0}},
-                    {bones.rightCalf, 4, {0, -40, 0}},
-                    {bones.rightFoot, 5, {0, -38, 0}, toe}});
-    return text.Write(frameCount, 0.033334, [](size_t joint, int frame) {
+    const std::vector<TextJoint> joints{{bones.hip, -1, kVec3Zero},
+                                        {bones.leftThigh, 0, {9, -4, 0}},
+                                        {bones.leftCalf, 1, {0, -40, 0}},
+                                        {bones.leftFoot, 2, {0, -38, 0}, toe},
+                                        {bones.rightThigh, 0, {-9, -4, 0}},
+                                        {bones.rightCalf, 4, {0, -40, 0}},
+                                        {bones.rightFoot, 5, {0, -38, 0}, toe}};
+    return MadeText(joints, frameCount, 0.033334, [](size_t joint, int frame) {
         const auto n = static_cast<float>(5 * frame);
         return joint == 0 ? TextKey{{0, 80, n}, {0, n, 0}}
                           : TextKey{kVec3Zero, {joint % 2 == 0 ? n : -n, 0, 0}};

@@ -1,400 +1,272 @@
 #include "CMadeSkeleton.h"
 
 #include "Angles.h"
-#include "Euler.h"
-#include "TempFolder.h"
+#include "Directions.h"
 #include "Text.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace gw {
 namespace {
 
-constexpr Mat3 kZUp{{1, 0, 0, 0, 0, 1, 0, -1, 0}};
-constexpr Mat3 kTurned{{0, 0, 1, 0, 1, 0, -1, 0, 0}};
+// Separated by commas.
+constexpr std::string_view kRecipes =
+    "plain, bare, notoes, nofeet walk, noclavicle, noclavicle neck0 bare, "
+    "fingers toes5 face headend, headend neck3 bare, face neck2, neck0, spine1, spine2, spine6, "
+    "spine10 neck3, helpers fingers notoes, hipjoints zup, hipjoints notoes bare walk, "
+    "twist fingers apose, twist hipjoints helpers fingers toes5, twistleaf fingers down, root, "
+    "root prop torsofirst, sword, sword fingers down, tail, rightfirst zup metres, "
+    "torsofirst rightfirst fingers, zup turned, apose bare metres, down twist fingers, "
+    "nopose walk rightfirst fingers, nopose walk zup helpers, nopose walk notoes, nopose, "
+    "walk notoes bare twist, child fingers down, longarms noclavicle apose";
 
 float SideX(EBodySide side)
 {
     return side == EBodySide::Left ? 1.0f : -1.0f;
 }
 
-Vec3 Through(const Vec3& v, const Mat3& m)
-{
-    return m.Row(0) * v.x + m.Row(1) * v.y + m.Row(2) * v.z;
-}
-
-// Returns any rotation that takes +x to a direction.
-Mat3 AlongX(const Vec3& direction)
-{
-    const Vec3 x = Vec3Normalized(direction);
-    const Vec3 helper = std::fabs(x.z) < 0.9f ? kVec3UnitZ : kVec3UnitY;
-    Mat3 m;
-    m.SetRow(0, x);
-    m.SetRow(1, Vec3Normalized(Vec3Cross(helper, x)));
-    m.SetRow(2, Vec3Cross(m.Row(0), m.Row(1)));
-    return m;
-}
-
-Mat3 Turn(const Vec3& degrees)
-{
-    const auto about = [](const Vec3& axis, float angle) {
-        return Mat3FromAxisAngle(axis, angle * kDegreesToRadians);
-    };
-    return about(kVec3UnitX, degrees.x) * about(kVec3UnitY, degrees.y) * about(kVec3UnitZ, degrees.z);
-}
-
 } // namespace
 
-CMadeSkeleton::CMadeSkeleton(std::string_view recipe, unsigned seed) : m_kRecipe(recipe), m_kRandom(seed)
+std::vector<std::string> SkeletonRecipes()
+{
+    std::vector<std::string> recipes;
+    for (std::string_view rest = kRecipes; !rest.empty();)
+        recipes.emplace_back(NextToken(rest, ","));
+    return recipes;
+}
+
+CMadeSkeleton::CMadeSkeleton(std::string_view recipe, unsigned seed)
+    : m_kRecipe(' ' + std::string(recipe) + ' '), m_kRandom(seed),
+      m_kAxes((Has("turned") ? TurnAbout(kVec3UnitY, -90.0) : kMat3Identity) *
+              (Has("zup") ? TurnAbout(kVec3UnitX, 90.0) : kMat3Identity)),
+      m_kFigure(std::span<const MadeBone>(), Has("metres") ? 0.01 : 1.0)
 {
     AddBody();
     if (Has("nopose"))
-        TurnFrames(*m_spkRoot);
-    const CTempFolder folder;
-    WriteBytes(folder.Path("made.bvh"), Text());
-    m_kMotion.Load(folder.Path("made.bvh"));
-}
-
-std::string CMadeSkeleton::NameAt(BodyPlace place) const
-{
-    const auto found = m_kRoles.find(IndexOf(place));
-    return found == m_kRoles.end() ? std::string() : found->second;
+        TurnFrames();
+    for (const Joint& joint : m_kJoints)
+    {
+        const Joint& parent = m_kJoints[joint.parent];
+        const Vec3 offset = Turned(joint.place - parent.place, m_kAxes);
+        m_kFigure.Move(joint.node->GetName(), ToLocal(offset, parent.frame));
+    }
+    for (const Joint& joint : m_kJoints)
+        m_kFigure.AddMesh(joint.node->GetName(), ToLocal(Turned(joint.tip, m_kAxes), joint.frame));
+    m_kFigure.Record(
+        Has("walk") ? 24 : 1, [this](CMadeFigure&, int frame) { Pose(frame); }, 0.04f);
+    m_kMotion.motionRoot = &m_kFigure.Root();
 }
 
 bool CMadeSkeleton::Has(std::string_view word) const
 {
-    std::string_view rest = m_kRecipe;
-    for (std::string_view token = NextToken(rest); !token.empty(); token = NextToken(rest))
-    {
-        if (token == word)
-            return true;
-    }
-    return false;
+    return m_kRecipe.find(' ' + std::string(word) + ' ') != m_kRecipe.npos;
 }
 
 int CMadeSkeleton::Number(std::string_view word, int otherwise) const
 {
-    constexpr int kMost = 10;
-    for (int number = 0; number <= kMost; ++number)
-    {
-        if (Has(std::string(word) + std::to_string(number)))
-            return number;
-    }
-    return otherwise;
+    const size_t at = m_kRecipe.find(word);
+    return at == m_kRecipe.npos ? otherwise : std::stoi(m_kRecipe.substr(at + word.size()));
 }
 
-double CMadeSkeleton::Jitter(double value)
+float CMadeSkeleton::Jitter()
 {
-    return value * std::uniform_real_distribution(0.97, 1.03)(m_kRandom);
+    return Has("exact") ? 1.0f : std::uniform_real_distribution(0.97f, 1.03f)(m_kRandom);
 }
 
-CMadeSkeleton::Joint& CMadeSkeleton::Add(Joint* parent, const Vec3& place)
+// Adds a joint with a name that says nothing; the first one is the root.
+size_t CMadeSkeleton::Add(size_t parent, const Vec3& place, CNode** role)
 {
     constexpr std::string_view kLetters = "bcdfgkmnpqvwxz";
-    auto joint = std::make_unique<Joint>();
-    joint->name.resize(10);
-    for (char& letter : joint->name)
+    std::string name(10, ' ');
+    for (char& letter : name)
         letter = kLetters[m_kRandom() % kLetters.size()];
-    joint->place = place;
-    joint->parent = parent;
-    if (!parent)
-        return *(m_spkRoot = std::move(joint));
-    return *parent->children.emplace_back(std::move(joint));
+    const std::string above = m_kJoints.empty() ? "" : m_kJoints[parent].node->GetName();
+    m_kJoints.push_back({&m_kFigure.AddBone(name, above, kVec3Zero), parent, place});
+    if (role)
+        *role = m_kJoints.back().node;
+    return m_kJoints.size() - 1;
 }
 
-CMadeSkeleton::Joint& CMadeSkeleton::AddAt(Joint& parent, const Vec3& place, BodyPlace role)
+// Adds the joint at the end of a long bone, with the bone's twist joints.
+size_t CMadeSkeleton::AddBone(size_t from, const Vec3& to, CNode** role)
 {
-    Joint& joint = Add(&parent, place);
-    m_kRoles[IndexOf(role)] = joint.name;
-    return joint;
+    const Vec3 middle = (m_kJoints[from].place + to) * 0.5f;
+    if (Has("twistleaf"))
+        Add(from, middle);
+    return Add(Has("twist") ? Add(from, middle) : from, to, role);
 }
 
-// Adds the joint at the end of a bone, with the bone's twist joints.
-CMadeSkeleton::Joint& CMadeSkeleton::AddBone(Joint& from, const Vec3& to, BodyPlace role, bool twists)
+size_t CMadeSkeleton::AddHelpers(size_t parent, const Vec3& place)
 {
-    const Vec3 middle = (from.place + to) * 0.5f;
-    if (Has("twistleaf") && twists)
-        Add(&from, middle);
-    return AddAt(Has("twist") && twists ? Add(&from, middle) : from, to, role);
-}
-
-CMadeSkeleton::Joint& CMadeSkeleton::AddHelpers(Joint& parent, const Vec3& place)
-{
-    if (!Has("helpers"))
-        return parent;
-    return Add(&Add(&parent, parent.place), place);
+    return Has("helpers") ? Add(Add(parent, m_kJoints[parent].place), place) : parent;
 }
 
 void CMadeSkeleton::AddBody()
 {
-    const Vec3 at{0.0f, 95.0f, 0.0f};
-    Joint* above = Has("root") ? &Add(nullptr, kVec3Zero) : nullptr;
-    Joint& hip = Add(above, at);
-    m_kRoles[IndexOf({EBodyJoint::Hip})] = hip.name;
-    const EBodySide first = Has("rightfirst") ? EBodySide::Right : EBodySide::Left;
-    const EBodySide second = Has("rightfirst") ? EBodySide::Left : EBodySide::Right;
-    if (Has("prop") && above)
-        Add(above, {40.0f, 60.0f, 20.0f}).tip = {0.0f, 30.0f, 0.0f};
+    const size_t above = Has("root") ? Add(0, kVec3Zero) : 0;
+    const size_t hip = Add(above, {0.0f, 95.0f, 0.0f}, &m_kBody.hip);
+    if (Has("prop"))
+        m_kJoints[Add(above, {40.0f, 60.0f, 20.0f})].tip = {0.0f, 30.0f, 0.0f};
     if (Has("torsofirst"))
         AddTrunk(hip);
-    AddLeg(hip, first);
-    AddLeg(hip, second);
+    AddLeg(hip, Has("rightfirst") ? EBodySide::Right : EBodySide::Left);
+    AddLeg(hip, Has("rightfirst") ? EBodySide::Left : EBodySide::Right);
     if (!Has("torsofirst"))
         AddTrunk(hip);
     if (Has("tail"))
-        Add(&Add(&Add(&hip, {0.0f, 92.0f, -12.0f}), {0.0f, 80.0f, -30.0f}), {0.0f, 70.0f, -55.0f});
+        Add(Add(Add(hip, {0.0f, 92.0f, -12.0f}), {0.0f, 80.0f, -30.0f}), {0.0f, 70.0f, -55.0f});
 }
 
-void CMadeSkeleton::AddTrunk(Joint& hip)
+void CMadeSkeleton::AddTrunk(size_t hip)
 {
     const int count = Number("spine", 3);
     const float height = count == 1 ? 25.0f : 42.0f;
-    Joint* top = &hip;
+    size_t top = hip;
     for (int i = 1; i <= count; ++i)
     {
         const float share = static_cast<float>(i) / static_cast<float>(count);
-        const Vec3 place = hip.place + Vec3{0.0f, height * share, -4.0f * std::sin(3.0f * share)};
-        top = &AddAt(*top, place, {EBodyJoint::Spine});
+        const float curve = Has("exact") ? 0.0f : -4.0f * std::sin(3.0f * share);
+        top = Add(top, {0.0f, 95.0f + height * share, curve}, &m_kBody.spine.emplace_back());
     }
-    const bool rightFirst = Has("rightfirst");
     if (Has("torsofirst"))
-        AddHead(*top);
-    AddArm(*top, rightFirst ? EBodySide::Right : EBodySide::Left);
-    AddArm(*top, rightFirst ? EBodySide::Left : EBodySide::Right);
+        AddHead(top);
+    AddArm(top, Has("rightfirst") ? EBodySide::Right : EBodySide::Left);
+    AddArm(top, Has("rightfirst") ? EBodySide::Left : EBodySide::Right);
     if (!Has("torsofirst"))
-        AddHead(*top);
+        AddHead(top);
 }
 
-void CMadeSkeleton::AddHead(Joint& chest)
+void CMadeSkeleton::AddHead(size_t chest)
 {
-    Joint* top = &chest;
+    const int count = Number("neck", 1);
+    const float forward = Has("exact") ? 0.0f : 1.0f;
+    size_t top = chest;
     float y = 152.0f;
-    for (int i = Number("neck", 1); i > 0; --i)
+    for (int i = 0; i < count; ++i)
     {
-        Joint& neck = Add(top, {0.0f, y, 1.0f});
-        if (top == &chest)
-            m_kRoles[IndexOf({EBodyJoint::Neck})] = neck.name;
-        top = &neck;
-        y += 10.0f / static_cast<float>(Number("neck", 1));
+        top = Add(top, {0.0f, y, forward}, &m_kBody.neck.emplace_back());
+        y += 10.0f / static_cast<float>(count);
     }
-    Joint& head = AddAt(*top, {0.0f, std::max(y, 160.0f), 2.0f}, {EBodyJoint::Head});
-    head.tip = Has("bare") ? kVec3Zero : Vec3{0.0f, 18.0f, 0.0f};
+    const Vec3 place{0.0f, std::max(y, 160.0f), 2.0f * forward};
+    const size_t head = Add(top, place, &m_kBody.head);
+    m_kJoints[head].tip = {0.0f, Has("bare") ? 0.0f : 18.0f, 0.0f};
     if (Has("headend"))
-        Add(&head, head.place + Vec3{0.0f, 19.0f, 1.0f});
+        Add(head, place + Vec3{0.0f, 19.0f, 1.0f});
     if (!Has("face"))
         return;
-    Add(&head, head.place + Vec3{3.2f, 8.0f, 8.0f});
-    Add(&head, head.place + Vec3{-3.2f, 8.0f, 8.0f});
-    Add(&Add(&head, head.place + Vec3{0.0f, 2.0f, 5.0f}), head.place + Vec3{0.0f, 0.0f, 9.0f});
+    Add(head, place + Vec3{3.2f, 8.0f, 8.0f});
+    Add(head, place + Vec3{-3.2f, 8.0f, 8.0f});
+    Add(Add(head, place + Vec3{0.0f, 2.0f, 5.0f}), place + Vec3{0.0f, 0.0f, 9.0f});
 }
 
-void CMadeSkeleton::AddLeg(Joint& hip, EBodySide side)
+void CMadeSkeleton::AddLeg(size_t hip, EBodySide side)
 {
+    BodyLeg& leg = m_kBody.Leg(side);
     const float x = 9.0f * SideX(side);
-    const auto length = static_cast<float>(Has("child") ? 0.7 : 1.0);
+    const float length = Has("child") ? 0.7f : 1.0f;
     const Vec3 hipPlace{x, 91.0f, 0.5f};
-    const Vec3 knee = hipPlace + Vec3{0.3f * x, -41.0f * length, 0.4f} * static_cast<float>(Jitter(1.0));
-    const Vec3 ankle = knee + Vec3{0.0f, -40.0f * length, -1.2f} * static_cast<float>(Jitter(1.0));
-    Joint& top = Has("hipjoints") ? Add(&hip, {0.4f * x, 93.0f, 0.0f}) : hip;
-    Joint& thigh = AddAt(AddHelpers(top, hipPlace), hipPlace, {EBodyJoint::Thigh, side});
-    Joint& shin = AddBone(thigh, knee, {EBodyJoint::Shin, side}, true);
-    thigh.swing = {25.0f * SideX(side), 0.0f, 0.0f};
-    shin.swing = {30.0f, 0.0f, 0.0f};
+    const Vec3 knee = hipPlace + Vec3{0.3f * x, -41.0f * length, 0.4f} * Jitter();
+    const Vec3 ankle = knee + Vec3{0.0f, -40.0f * length, -1.2f} * Jitter();
+    const float share = side == EBodySide::Left ? 0.6f : 0.4f;
+    const size_t top = Has("hipjoints") ? Add(hip, {share * x, 93.0f, 0.0f}) : hip;
+    const size_t thigh = Add(AddHelpers(top, hipPlace), hipPlace, &leg.thigh);
+    const size_t shin = AddBone(thigh, knee, &leg.shin);
+    m_kJoints[thigh].swing = 25.0 * SideX(side);
+    m_kJoints[shin].bend = 22.0;
+    m_kJoints[shin].swing = 18.0;
     if (Has("nofeet"))
-        shin.tip = ankle - knee;
+        m_kJoints[shin].tip = ankle - knee;
     else
-        AddFoot(AddBone(shin, ankle, {EBodyJoint::Foot, side}, true), side, x);
+        AddFoot(shin, ankle, side);
 }
 
-void CMadeSkeleton::AddFoot(Joint& ankle, EBodySide side, float x)
+void CMadeSkeleton::AddFoot(size_t shin, const Vec3& ankle, EBodySide side)
 {
-    const Vec3 ball = ankle.place + Vec3{0.06f * x, -7.0f, 13.0f};
-    ankle.tip = Has("bare") ? kVec3Zero : ball - ankle.place;
+    BodyLeg& leg = m_kBody.Leg(side);
+    const float x = 9.0f * SideX(side);
+    const Vec3 ball = ankle + Vec3{0.06f * x, -7.0f, 13.0f};
+    const size_t foot = AddBone(shin, ankle, &leg.foot);
+    m_kJoints[foot].tip = Has("bare") ? kVec3Zero : ball - ankle;
     if (Has("notoes"))
         return;
-    Joint& toe = AddAt(ankle, ball, {EBodyJoint::Toe, side});
-    toe.tip = {0.0f, 0.0f, Has("bare") ? 0.0f : 6.0f};
-    for (int i = 0; Has("toes5") && i < 5; ++i)
-        Add(&Add(&toe, ball + Vec3{0.2f * static_cast<float>(i - 2) * x, 0.0f, 2.0f}),
-            ball + Vec3{0.2f * static_cast<float>(i - 2) * x, 0.0f, 5.0f});
+    const size_t toe = Add(foot, ball, &leg.toe);
+    m_kJoints[toe].tip = {0.0f, 0.0f, Has("bare") ? 0.0f : 6.0f};
+    for (int i = -2; Has("toes5") && i <= 2; ++i)
+    {
+        const Vec3 beside = ball + Vec3{0.2f * static_cast<float>(i) * x, 0.0f, 2.0f};
+        Add(Add(toe, beside), beside + kVec3UnitZ * 3.0f);
+    }
 }
 
-void CMadeSkeleton::AddArm(Joint& chest, EBodySide side)
+void CMadeSkeleton::AddArm(size_t chest, EBodySide side)
 {
+    BodyArm& arm = m_kBody.Arm(side);
     const float s = SideX(side);
     const double dip = Has("down") ? 82.0 : Has("apose") ? 42.0 : 0.0;
     const auto angle = static_cast<float>(dip * kDegreesToRadians64);
     const float size = Has("longarms") ? 1.2f : Has("child") ? 0.75f : 1.0f;
     const Vec3 along{s * std::cos(angle), -std::sin(angle), 0.02f};
+    const Vec3 clavicle{3.0f * s, 147.0f, 1.0f};
     const Vec3 shoulder{17.5f * s, 146.0f, -1.0f};
-    const Vec3 elbow = shoulder + along * (28.0f * size * static_cast<float>(Jitter(1.0)));
-    const Vec3 wrist =
-        elbow + (along + Vec3{0.0f, 0.0f, 0.05f}) * (25.5f * size * static_cast<float>(Jitter(1.0)));
-    Joint* top = &chest;
-    if (!Has("noclavicle"))
-        top = &AddAt(AddHelpers(chest, {3.0f * s, 147.0f, 1.0f}), {3.0f * s, 147.0f, 1.0f},
-                     {EBodyJoint::Clavicle, side});
-    Joint& upper = AddAt(*top, shoulder, {EBodyJoint::UpperArm, side});
-    Joint& forearm = AddBone(upper, elbow, {EBodyJoint::Forearm, side}, true);
-    Joint& hand = AddBone(forearm, wrist, {EBodyJoint::Hand, side}, true);
-    upper.swing = {-20.0f * s, 0.0f, 0.0f};
-    hand.tip = along * (Has("bare") ? 0.0f : 9.0f);
+    const Vec3 elbow = shoulder + along * (28.0f * size * Jitter());
+    const Vec3 wrist = elbow + (along + kVec3UnitZ * 0.05f) * (25.5f * size * Jitter());
+    const size_t top = Has("noclavicle") ? chest : Add(AddHelpers(chest, clavicle), clavicle, &arm.clavicle);
+    const size_t upper = Add(top, shoulder, &arm.upperArm);
+    const size_t hand = AddBone(AddBone(upper, elbow, &arm.forearm), wrist, &arm.hand);
+    m_kJoints[upper].swing = -20.0 * s;
+    m_kJoints[hand].tip = along * (Has("bare") ? 0.0f : 9.0f);
     if (Has("fingers"))
         AddFingers(hand, along);
+    if (Has("handend"))
+        Add(hand, wrist + along * 9.0f);
+    const Vec3 grip = wrist + along * 7.0f;
     if (Has("sword") && side == EBodySide::Right)
-        Add(&Add(&hand, wrist + along * 7.0f), wrist + along * 7.0f + Vec3{0.0f, 20.0f, 90.0f});
+        Add(Add(hand, grip), grip + Vec3{0.0f, 20.0f, 90.0f});
 }
 
-void CMadeSkeleton::AddFingers(Joint& hand, const Vec3& along)
+void CMadeSkeleton::AddFingers(size_t hand, const Vec3& along)
 {
+    const Vec3 wrist = m_kJoints[hand].place;
     for (int i = -2; i <= 2; ++i)
     {
-        Joint* joint = &hand;
+        size_t joint = hand;
         for (const float step : {i == -2 ? 4.0f : 9.0f, 13.0f, 15.5f})
-            joint = &Add(joint, hand.place + along * step + Vec3{0.0f, 0.0f, -1.8f * static_cast<float>(i)});
+            joint = Add(joint, wrist + along * step + Vec3{0.0f, 0.0f, -1.8f * static_cast<float>(i)});
     }
 }
 
 // Rotates the frame of every joint so that its first child is along x.
-void CMadeSkeleton::TurnFrames(Joint& joint)
+void CMadeSkeleton::TurnFrames()
 {
-    const Vec3 bone = joint.children.empty() ? joint.tip : joint.children.front()->place - joint.place;
-    if (Vec3Length(bone) > 0.0)
-        joint.world = AlongX(World(bone));
-    for (const auto& child : joint.children)
-        TurnFrames(*child);
-}
-
-// Converts from the stance's axes to the file's.
-Vec3 CMadeSkeleton::World(const Vec3& place) const
-{
-    Vec3 world = Has("turned") ? Through(place, kTurned) : place;
-    world = Has("zup") ? Through(world, kZUp) : world;
-    return Has("metres") ? world * 0.01f : world;
-}
-
-Vec3 CMadeSkeleton::OffsetOf(const Joint& joint) const
-{
-    if (!joint.parent)
-        return kVec3Zero;
-    return Through(World(joint.place - joint.parent->place), Mat3Transpose(joint.parent->world));
-}
-
-void CMadeSkeleton::AppendJoints(std::vector<TextJoint>& joints, const Joint& joint, int parent) const
-{
-    const auto self = static_cast<int>(joints.size());
-    const Vec3 tip = Through(World(joint.tip), Mat3Transpose(joint.world));
-    joints.push_back({joint.name, parent, OffsetOf(joint), tip});
-    for (const auto& child : joint.children)
-        AppendJoints(joints, *child, self);
-}
-
-// Appends the angles of a joint and its subtree for a step of the walk; legs and arms swing about the
-// stance's x axis, knees only backward.
-void CMadeSkeleton::AppendRotations(std::vector<Vec3>& degrees, const Joint& joint, const Mat3& parentTurn,
-                                    double phase) const
-{
-    const double swing = Has("walk") ? std::sin(phase) : 0.0;
-    const bool isKnee = joint.swing.x == 30.0f;
-    const auto amount = static_cast<float>(isKnee ? Has("walk") * (1.2 + swing) * 0.6 : swing);
-    Mat3 turn = Turn(joint.swing * amount);
-    if (amount != 0.0f)
+    for (size_t i = 0; i < m_kJoints.size(); ++i)
     {
-        // The swing axis in the file's axes.
-        Mat3 axes;
-        axes.SetRow(0, Vec3Normalized(World(kVec3UnitX)));
-        axes.SetRow(1, Vec3Normalized(World(kVec3UnitY)));
-        axes.SetRow(2, Vec3Normalized(World(kVec3UnitZ)));
-        turn = Mat3Transpose(axes) * turn * axes;
+        Joint& joint = m_kJoints[i];
+        const auto child = std::find_if(m_kJoints.begin() + static_cast<ptrdiff_t>(i) + 1, m_kJoints.end(),
+                                        [=](const Joint& other) { return other.parent == i; });
+        const Vec3 bone = child == m_kJoints.end() ? joint.tip : child->place - joint.place;
+        joint.frame = LeastSwing(kVec3UnitX, Turned(bone, m_kAxes));
     }
-    const Mat3 world = turn * parentTurn;
-    const Mat3 parentWorld = joint.parent ? joint.parent->world * parentTurn : kMat3Identity;
-    const Mat3 local = joint.world * world * Mat3Transpose(parentWorld);
-    Vec3 angles;
-    Mat3ToEuler(local, static_cast<int>(EEulerOrder::ZXY), angles.x, angles.y, angles.z);
+}
+
+// Poses a frame: legs and arms swing about the stance's x axis, knees only backward.
+void CMadeSkeleton::Pose(int frame)
+{
+    m_kFigure.Move(Root().GetName(), Turned(m_kJoints[0].place, m_kAxes));
     if (Has("rest"))
-        angles = kVec3Zero;
-    degrees.push_back(angles * (1.0f / kDegreesToRadians));
-    for (const auto& child : joint.children)
-        AppendRotations(degrees, *child, world, phase);
-}
-
-std::string CMadeSkeleton::Text() const
-{
-    std::vector<TextJoint> joints;
-    AppendJoints(joints, *m_spkRoot, -1);
-    std::vector<Vec3> degrees; // of a frame, joint by joint
-    const auto key = [&](size_t joint, int frame) {
-        if (joint == 0)
-        {
-            degrees.clear();
-            AppendRotations(degrees, *m_spkRoot, kMat3Identity, 0.5 * frame);
-        }
-        return TextKey{joint == 0 ? World(m_spkRoot->place) : kVec3Zero, degrees[joint]};
-    };
-    return CMadeText(std::move(joints)).Write(Has("walk") ? 24 : 1, 0.04, key);
-}
-
-std::vector<std::string> SkeletonRecipes()
-{
-    return {
-        "",
-        "bare",
-        "notoes",
-        "nofeet walk",
-        "noclavicle",
-        "noclavicle neck0 bare",
-        "fingers",
-        "fingers toes5 face headend",
-        "headend bare",
-        "headend neck3 bare",
-        "face neck2",
-        "neck0",
-        "neck3",
-        "spine1",
-        "spine2",
-        "spine4",
-        "spine6",
-        "spine10 neck3",
-        "helpers",
-        "helpers fingers notoes",
-        "hipjoints",
-        "hipjoints zup",
-        "hipjoints notoes bare walk",
-        "twist",
-        "twist fingers apose",
-        "twist hipjoints helpers fingers toes5",
-        "twistleaf",
-        "twistleaf fingers down",
-        "root",
-        "root prop",
-        "root prop torsofirst",
-        "sword",
-        "sword fingers down",
-        "tail",
-        "rightfirst",
-        "rightfirst zup metres",
-        "torsofirst",
-        "torsofirst rightfirst fingers",
-        "zup",
-        "zup turned",
-        "turned",
-        "apose",
-        "apose bare metres",
-        "down",
-        "down twist fingers",
-        "nopose walk",
-        "nopose walk rightfirst fingers",
-        "nopose walk zup helpers",
-        "nopose walk notoes",
-        "nopose",
-        "walk",
-        "walk notoes bare twist",
-        "child",
-        "child fingers down",
-        "longarms",
-        "longarms noclavicle apose",
-    };
+        return;
+    const double walk = Has("walk") ? 1.0 : 0.0;
+    const Vec3 axis = Turned(kVec3UnitX, m_kAxes);
+    std::vector<Mat3> turns; // from the stance, by joint
+    for (const Joint& joint : m_kJoints)
+    {
+        const Mat3 above = turns.empty() ? kMat3Identity : turns[joint.parent];
+        const double degrees = walk * (joint.bend + joint.swing * std::sin(0.5 * frame));
+        turns.push_back(TurnAbout(axis, degrees) * above);
+        const Mat3 parent = turns.size() == 1 ? kMat3Identity : m_kJoints[joint.parent].frame * above;
+        Mat4& matrix = joint.node->m_kMatrix;
+        matrix = Mat4Compose(joint.frame * turns.back() * Mat3Transpose(parent), matrix.Translation());
+    }
 }
 
 } // namespace gw

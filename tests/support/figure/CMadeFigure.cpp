@@ -1,9 +1,14 @@
 #include "CMadeFigure.h"
 
 #include "Angles.h"
+#include "BodyTree.h"
+#include "CBoneMesh.h"
 #include "CKeyframeControl.h"
 #include "MotionNode.h"
 #include "Skeleton.h"
+#include "TKBVHStream.h"
+
+#include <algorithm>
 
 namespace gw {
 namespace {
@@ -73,6 +78,22 @@ CNode& CMadeFigure::AddBone(const std::string& name, const std::string& parent, 
     const auto radians = static_cast<float>(degreesZ * kDegreesToRadians64);
     bone->m_kMatrix = Mat4Compose(Mat3FromAxisAngle(kVec3UnitZ, radians), offset * m_fUnit);
     return *bone;
+}
+
+void CMadeFigure::AddMesh(const std::string& name, const Vec3& end)
+{
+    CNode& bone = Bone(name);
+    std::vector<Vec3> ends;
+    for (const CNode* child : ChildNodes(bone))
+        ends.push_back(child->m_kMatrix.Translation());
+    const bool isLast = ends.empty();
+    if (isLast)
+        ends.push_back(end * m_fUnit);
+    const double length = Vec3Length(*std::ranges::max_element(ends, {}, Vec3Length));
+    CBoneMesh& mesh = AttachBone(bone, name, ends.size(), static_cast<float>(length));
+    mesh.m_kEnd = isLast ? ends[0] : kVec3Zero;
+    if (ends.size() == 1)
+        mesh.m_kMatrix = Mat4Compose(BoneTurn(ends[0]), kVec3Zero);
 }
 
 void CMadeFigure::Remove(const std::string& name)

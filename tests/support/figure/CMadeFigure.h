@@ -47,6 +47,8 @@ public:
     /// Adds a bone below another one, or as the root.
     CNode& AddBone(const std::string& name, const std::string& parent, const Vec3& offset,
                    double degreesZ = 0.0);
+    /// Gives a bone the mesh that the reader of BVH files would; `end` is that of a bone without children.
+    void AddMesh(const std::string& name, const Vec3& end);
     /// Removes a bone with its subtree: without "LToe" and "RToe", feet have no toes.
     void Remove(const std::string& name);
 

@@ -1,12 +1,10 @@
 #pragma once
 
-#include "CMadeText.h"
-#include "CMotionFile.h"
+#include "CMadeSkeleton.h"
 
-#include <map>
-#include <span>
 #include <string>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace gw {
@@ -22,7 +20,12 @@ struct Convention
     const char* arm;   ///< clavicle, upper arm, forearm, hand
     const char* leg;   ///< a joint above the thigh, thigh, shin, foot, toe
 };
-std::span<const Convention> Conventions();
+inline constexpr Convention kHumanIK{"HumanIK",
+                                     "Left Right",
+                                     "Hips Spine Spine1",
+                                     "Neck Head",
+                                     "*Shoulder *Arm *ForeArm *Hand",
+                                     "- *UpLeg *Leg *Foot *ToeBase"};
 
 /// How a skeleton differs from its convention.
 struct BodyChange
@@ -47,31 +50,29 @@ struct BodyChange
     } names = Right;
 };
 
-/// A human body in a T-pose facing z, in cm, read from a motion file of two frames.
+/// A human body in a T-pose facing z, in cm, with the names of a convention.
 class CNamedBody
 {
 public:
     CNamedBody(const Convention& convention, const BodyChange& change);
 
-    CNode& Root() const { return *m_kMotion.motionRoot; }
+    CNode& Root() const { return m_kMade.Root(); }
+    const CBodyMap& Body() const { return m_kMade.Body(); }
     /// Returns whether a joint with this name may drive a target bone of the host skeleton.
-    bool MayDrive(const std::string& target, std::string_view joint) const;
+    bool MayDrive(std::string_view target, std::string_view joint) const;
 
 private:
-    int Add(int parent, const std::string& name, std::string_view targets, float x, float y, float z);
-    void AddTrunk();
-    void AddHead(int chest);
-    void AddArm(int chest, float side);
-    void AddHand(int hand, float side);
-    void AddLeg(float side);
-    std::string NameFor(std::string name, float side) const;
+    using Part = std::pair<CNode*, const char*>; // a joint and its target, without the side
+    void NameTrunk();
+    void NameFingers(CNode& hand, EBodySide side);
+    void NameLimbs(EBodySide side);
+    void NameLimb(EBodySide side, const std::vector<std::string>& names, const std::vector<Part>& parts);
+    void Name(CNode& joint, std::string name, EBodySide side, const std::string& target = {});
 
     const Convention& convention_;
     BodyChange m_kChange;
-    std::vector<TextJoint> m_kJoints;
-    /// the targets that a joint may drive, separated by blanks
-    std::map<std::string, std::string> m_kTargets;
-    CMotionFile m_kMotion;
+    CMadeSkeleton m_kMade;
+    std::vector<std::pair<std::string, std::string>> m_kDrives; // joints, and targets that each may drive
 };
 
 } // namespace gw
