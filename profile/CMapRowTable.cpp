@@ -70,17 +70,18 @@ void CMapRowTable::IndexTargets() const
 void CMapRowTable::AddRow(std::string_view source, std::string_view target, const RowNumbers& numbers,
                           ERowColumns columns)
 {
-    const int found = FindTarget(target);
-    if (found == kNone)
+    if (m_kRowOfTarget.empty())
+        IndexTargets();
+    const auto [found, isNew] = m_kRowOfTarget.try_emplace(LowerCase(target), RowCount());
+    if (isNew)
     {
         m_kRows.emplace_back()[kSourceColumn] = source;
         m_kSelected.push_back(false);
-        m_kRowOfTarget.emplace(LowerCase(target), RowCount() - 1);
     }
-    Row& row = found == kNone ? m_kRows.back() : m_kRows[Index(found)];
+    Row& row = m_kRows[Index(found->second)];
     row[kTargetColumn] = target;
-    // The comparison is with 0 instead of kNone: the first row keeps its initial rotation.
-    if (found != 0)
+    // The first row keeps its initial rotation.
+    if (isNew || found->second != 0)
         WriteRotation(row, numbers);
     if (columns == ERowColumns::All)
         WriteAxes(row, numbers.axes);

@@ -217,7 +217,7 @@ void CProfileEditorDialog::LoadLine(const ProfileLine& line)
         break;
     case EProfileLine::Fixed:
     case EProfileLine::Mapping:
-        AddMapRow(line.source, line.target, line.numbers);
+        AddMapRow(line.source, line.target, line.Numbers());
         break;
     }
 }

@@ -1,6 +1,5 @@
 #include "CProfileTexts.h"
 
-#include "CMappedFile.h"
 #include "Numbers.h"
 #include "Paths.h"
 #include "ProfileFile.h"
@@ -10,13 +9,17 @@
 #include <tuple>
 #include <unordered_map>
 
+#include <fcntl.h>
 #include <sys/stat.h>
+#include <unistd.h>
 
 namespace gw {
 
 namespace {
 
-constexpr off_t kPackByteLimit = off_t{64} << 20; // thousands of profiles
+// A thousand profiles. A file of this size is read, not mapped, so it can be replaced while its texts are
+// used.
+constexpr off_t kPackByteLimit = off_t{1} << 20;
 
 using PackedTexts = std::unordered_map<std::string_view, std::string_view>;
 
@@ -38,10 +41,30 @@ PackedTexts ReadPack(std::string_view rest)
     return texts;
 }
 
-bool StatusOf(const std::string& path, struct stat& status)
+// A folder's files by their names. The system then resolves the folder's path once, not for every file.
+class CFolder
 {
-    return stat(path.c_str(), &status) == 0;
-}
+public:
+    explicit CFolder(const std::string& folder)
+        : file_(open(folder.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC))
+    {
+    }
+    ~CFolder()
+    {
+        if (file_ >= 0)
+            close(file_);
+    }
+    CFolder(const CFolder&) = delete;
+    CFolder& operator=(const CFolder&) = delete;
+
+    bool StatusOf(const char* name, struct stat& status) const
+    {
+        return file_ >= 0 && fstatat(file_, name, &status, 0) == 0;
+    }
+
+private:
+    int file_;
+};
 
 // A copied installation can have times truncated to seconds, equally for all its files.
 bool IsNewer(const struct stat& a, const struct stat& b)
@@ -51,24 +74,23 @@ bool IsNewer(const struct stat& a, const struct stat& b)
 
 } // namespace
 
-CProfileTexts::CProfileTexts(const std::string& folder)
+CProfileTexts::CProfileTexts(const std::string& folder, EPack pack)
 {
     // The time is read before the content: a pack that is replaced in between then counts as old.
-    const std::string packPath = folder + std::string(kProfilePack);
+    const CFolder files(folder);
     struct stat packStatus;
     PackedTexts packed;
-    CMappedFile pack;
-    if (StatusOf(packPath, packStatus) && packStatus.st_size < kPackByteLimit &&
-        pack.Open(packPath) == EFailure::None)
-    {
-        m_kPack = pack.Text(); // a copy, because the file can be truncated while its texts are in use
-        packed = ReadPack(m_kPack);
-    }
-    for (const std::string& file : FilesInFolder(folder, ".prf"))
+    if (pack == EPack::Used && files.StatusOf(std::string(kProfilePack).c_str(), packStatus) &&
+        packStatus.st_size <= kPackByteLimit &&
+        m_kPack.Open(folder + std::string(kProfilePack)) == EFailure::None)
+        packed = ReadPack(m_kPack.Text());
+    const std::vector<std::string> names = FilesInFolder(folder, ".prf");
+    m_kEntries.reserve(names.size());
+    for (const std::string& file : names)
     {
         const auto found = packed.find(file);
         struct stat status;
-        const bool isPacked = found != packed.end() && StatusOf(folder + file, status) &&
+        const bool isPacked = found != packed.end() && files.StatusOf(file.c_str(), status) &&
                               static_cast<uint64_t>(status.st_size) == found->second.size() &&
                               !IsNewer(status, packStatus);
         Add(folder, file, isPacked ? std::optional(found->second) : std::nullopt);

@@ -1,5 +1,8 @@
 #pragma once
 
+#include "CMappedFile.h"
+
+#include <cstdint>
 #include <deque>
 #include <optional>
 #include <span>
@@ -11,7 +14,8 @@ namespace gw {
 
 /// The texts of all profiles in a folder, in name order, read once. An installation also contains one file
 /// with all its profiles, created when it is built. A profile's text is read from there if its own file has
-/// the packed size and is not newer than the pack, otherwise from its own file.
+/// the packed size and is not newer than the pack, otherwise from its own file. Only a file of another time
+/// and the same size, such as an older copy, can differ from its packed text.
 class CProfileTexts
 {
 public:
@@ -22,8 +26,14 @@ public:
         std::optional<std::string_view> text; ///< no value if the file cannot be read or is too long
     };
 
+    enum class EPack : uint8_t
+    {
+        Used,
+        Ignored,
+    };
+
     /// `folder` ends in a separator.
-    explicit CProfileTexts(const std::string& folder);
+    explicit CProfileTexts(const std::string& folder, EPack pack = EPack::Used);
     CProfileTexts(const CProfileTexts&) = delete;
     CProfileTexts& operator=(const CProfileTexts&) = delete;
 
@@ -32,7 +42,7 @@ public:
 private:
     void Add(const std::string& folder, const std::string& file, std::optional<std::string_view> packed);
 
-    std::string m_kPack;            // bytes of the pack
+    CMappedFile m_kPack;
     std::deque<std::string> m_kOwn; // texts that were read from their own files
     std::vector<Entry> m_kEntries;
 };

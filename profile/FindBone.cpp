@@ -4,6 +4,7 @@
 #include "Text.h"
 
 #include <algorithm>
+#include <cstdint>
 
 namespace gw {
 
@@ -19,9 +20,12 @@ std::vector<CObject*> NodesBelow(CNode* root)
 
 } // namespace
 
-CBoneNames::CBoneNames(CNode* root)
+CBoneNames::CBoneNames(CNode* root) : m_pkRoot(root)
 {
-    for (CObject* object : NodesBelow(root))
+    const std::vector<CObject*> nodes = NodesBelow(root);
+    m_kExact.reserve(nodes.size());
+    m_kNames.reserve(nodes.size());
+    for (CObject* object : nodes)
     {
         if (!object->GetName())
             continue;
@@ -37,19 +41,30 @@ CNode* CBoneNames::Find(std::string_view name) const
     const auto exact = m_kExact.find(name);
     if (exact != m_kExact.end())
         return exact->second;
-    const auto lower = LowerCaseNames().find(LowerCase(name));
-    return lower == m_kLowerCase.end() ? nullptr : lower->second;
+    const AnyCase& names = NamesInAnyCase();
+    const auto found = names.find(name);
+    return found == names.end() ? nullptr : found->second;
 }
 
 // Most look-ups match exactly, so this table is built only when one does not.
-const std::unordered_map<std::string, CNode*>& CBoneNames::LowerCaseNames() const
+const CBoneNames::AnyCase& CBoneNames::NamesInAnyCase() const
 {
-    if (m_kLowerCase.empty())
+    if (m_kAnyCase.empty())
     {
+        m_kAnyCase.reserve(m_kNames.size());
         for (const std::string& name : m_kNames)
-            m_kLowerCase.try_emplace(LowerCase(name), m_kExact.at(name)); // the first of equal names wins
+            m_kAnyCase.insert(*m_kExact.find(name)); // the first of equal names wins
     }
-    return m_kLowerCase;
+    return m_kAnyCase;
+}
+
+// The hash of Fowler, Noll and Vo. A letter and its capital differ only in the bit that is set here.
+size_t CBoneNames::Hash::operator()(std::string_view name) const
+{
+    uint64_t hash = 0xcbf29ce484222325;
+    for (const char c : name)
+        hash = (hash ^ (static_cast<unsigned char>(c) | 0x20u)) * 0x100000001b3;
+    return hash;
 }
 
 CNode* FindBone(CNode* root, std::string_view name)

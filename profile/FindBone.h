@@ -1,5 +1,7 @@
 #pragma once
 
+#include "Text.h"
+
 #include <string>
 #include <string_view>
 #include <unordered_map>
@@ -17,6 +19,7 @@ public:
     /// Lists the bones below a root; a null root has no bones.
     explicit CBoneNames(CNode* root);
 
+    CNode* Root() const { return m_pkRoot; }
     /// Returns the first node, in search order, with exactly this name, otherwise the first one that matches
     /// when ignoring case, or null. Nodes without a name are never found.
     CNode* Find(std::string_view name) const;
@@ -24,10 +27,23 @@ public:
     const std::vector<std::string>& Names() const { return m_kNames; }
 
 private:
-    const std::unordered_map<std::string, CNode*>& LowerCaseNames() const;
+    // Both ignore case.
+    struct Hash
+    {
+        size_t operator()(std::string_view name) const;
+    };
+    struct Equal
+    {
+        bool operator()(std::string_view a, std::string_view b) const { return EqualNoCase(a, b); }
+    };
+    using AnyCase = std::unordered_map<std::string_view, CNode*, Hash, Equal>;
 
-    std::unordered_map<std::string_view, CNode*> m_kExact;        ///< views of the nodes' own names
-    mutable std::unordered_map<std::string, CNode*> m_kLowerCase; ///< built when first needed
+    const AnyCase& NamesInAnyCase() const;
+
+    CNode* m_pkRoot;
+    // Views of the nodes' own names.
+    std::unordered_map<std::string_view, CNode*> m_kExact;
+    mutable AnyCase m_kAnyCase; // built when first needed
     std::vector<std::string> m_kNames;
 };
 

@@ -108,6 +108,11 @@ int CutToInteger(float value)
     return value < -kBeyond ? std::numeric_limits<int>::min() : static_cast<int>(value);
 }
 
+RowNumbers ProfileLine::Numbers() const
+{
+    return ParseNumbers(numberText);
+}
+
 CProfileReader::CProfileReader(std::string_view text) : m_kRest(SkipByteOrderMark(text))
 {
     std::string_view name;
@@ -166,7 +171,7 @@ bool CProfileReader::Next(ProfileLine& line)
     line.kind = fixed ? EProfileLine::Fixed : EProfileLine::Mapping;
     line.source = fixed ? kFixedSource : first;
     line.target = fixed ? second : third;
-    line.numbers = ParseNumbers(fourth);
+    line.numberText = fourth;
     return true;
 }
 

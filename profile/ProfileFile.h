@@ -51,16 +51,20 @@ enum class EProfileLine : uint8_t
     Mapping, ///< a source bone that drives a target bone
 };
 
-/// A line of a profile after the first. Only the members of its kind are used.
+/// A line of a profile after the first. Only the members of its kind are used. Texts are views of the
+/// profile's text.
 struct ProfileLine
 {
+    /// Returns the numbers of a row. They are parsed here, because a search by names does not need them.
+    RowNumbers Numbers() const;
+
     EProfileLine kind = EProfileLine::Mapping;
     size_t line = 0; ///< in the file, starting at 1
     Vec3 position = kVec3Zero;
     int frameRate = 0;
-    std::string source; ///< kFixedSource for a fixed row
-    std::string target;
-    RowNumbers numbers;
+    std::string_view source; ///< kFixedSource for a fixed row
+    std::string_view target;
+    std::string_view numberText;
 };
 
 /// Reads the text of a profile line by line. It never fails: a line with too few tokens uses those of the

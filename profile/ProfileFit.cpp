@@ -29,7 +29,7 @@ CMapRowTable ReadRows(CProfileReader& reader, std::vector<size_t>& lines)
     while (reader.Next(line))
     {
         if (line.kind == EProfileLine::Fixed || line.kind == EProfileLine::Mapping)
-            rows.AddRow(line.source, line.target, line.numbers, ERowColumns::All);
+            rows.AddRow(line.source, line.target, line.Numbers(), ERowColumns::All);
         lines.resize(static_cast<size_t>(rows.RowCount()), line.line);
     }
     rows.AddPelvisRows();

@@ -88,12 +88,13 @@ CKeyframeControl& CMotionAligner::AddTrack(CNode& node)
 
 void CMotionAligner::AddBone(const JointAlignment& joint, CNode& node)
 {
-    const CBoneMesh* const old = FindBoneMesh(*joint.node);
+    CBoneMesh* const old = FindBoneMesh(*joint.node);
     if (!old)
         return;
     const size_t children = ChildNodes(*joint.node).size();
     const Vec3 end = Turned(NodeBoneEnd(*joint.node), joint.turn);
-    CBoneMesh& mesh = AttachBone(node, std::string(node.NameView()), children, old->m_fLength);
+    const EBoneMeshes meshes = old->XYZBuffer().empty() ? EBoneMeshes::Empty : EBoneMeshes::Drawn;
+    CBoneMesh& mesh = AttachBone(node, std::string(node.NameView()), children, old->m_fLength, meshes);
     mesh.m_kEnd = children == 0 || old->m_kEnd != kVec3Zero ? end : kVec3Zero;
     if (joint.axis != kVec3Zero)
         mesh.m_kMatrix = Mat4Compose(BoneTurn(joint.axis), kVec3Zero);

@@ -129,11 +129,23 @@ constexpr auto kSortedLexicon = [] {
     return words;
 }();
 
+constexpr size_t kLetterCount = 'z' - 'a' + 1;
+
+// The index of the first word that starts with a letter or a later one.
+constexpr auto kFirstWord = [] {
+    std::array<uint8_t, kLetterCount + 1> first{};
+    for (size_t letter = 0; letter <= kLetterCount; ++letter)
+        first[letter] = static_cast<uint8_t>(std::ranges::count_if(
+            kLexicon, [=](const Word& word) { return word.text.front() < static_cast<char>('a' + letter); }));
+    return first;
+}();
+
 std::span<const Word> WordsFrom(char letter)
 {
-    const auto first = [](const Word& word) { return word.text.front(); };
-    const auto begin = std::ranges::lower_bound(kSortedLexicon, letter, {}, first);
-    return {begin, std::ranges::upper_bound(kSortedLexicon, letter, {}, first)};
+    if (letter < 'a' || letter > 'z')
+        return {};
+    const auto index = static_cast<size_t>(letter - 'a');
+    return std::span(kSortedLexicon).subspan(kFirstWord[index], kFirstWord[index + 1] - kFirstWord[index]);
 }
 
 constexpr uint32_t kSides = kLeft | kRight;
@@ -189,27 +201,31 @@ std::optional<uint32_t> Features(std::string_view token)
         return {};
     struct Part
     {
-        size_t words;
+        size_t words; // SIZE_MAX if none are known
         uint32_t features;
     };
-    std::array<std::optional<Part>, kLongestToken + 1> parts; // of the first n letters
-    parts[0] = Part{0, kNothing};
+    std::array<Part, kLongestToken + 1> parts; // of the first n letters
+    parts[0] = {0, kNothing};
+    std::fill_n(&parts[1], token.size(), Part{SIZE_MAX, kNothing});
     for (size_t begin = 0; begin < token.size(); ++begin)
     {
-        if (!parts[begin])
+        const Part& part = parts[begin];
+        if (part.words == SIZE_MAX)
             continue;
         for (const Word& word : WordsFrom(token[begin]))
         {
-            if (!token.substr(begin).starts_with(word.text))
+            const size_t end = begin + word.text.size();
+            // Few words have the right last letter, too.
+            if (end > token.size() || token[end - 1] != word.text.back() ||
+                !token.substr(begin).starts_with(word.text))
                 continue;
-            std::optional<Part>& part = parts[begin + word.text.size()];
-            const Part longer{parts[begin]->words + 1, parts[begin]->features | word.features};
-            if (!part || longer.words < part->words)
-                part = longer;
+            Part& longer = parts[end];
+            if (part.words + 1 < longer.words)
+                longer = {part.words + 1, part.features | word.features};
         }
     }
-    const std::optional<Part>& whole = parts[token.size()];
-    return whole ? std::optional(whole->features) : std::nullopt;
+    const Part& whole = parts[token.size()];
+    return whole.words < SIZE_MAX ? std::optional(whole.features) : std::nullopt;
 }
 
 // The same with a side that a letter stands for. Nothing for any other letter.

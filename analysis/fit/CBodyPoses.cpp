@@ -39,13 +39,13 @@ Vec3 Middle(const Vec3& a, const Vec3& b)
 CBodyPoses::CBodyPoses(const CBodyMap& body, const BodyStance& rest)
     : body_(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
 {
+    if (!ShowsBody(rest))
+        PlanFrames();
     for (const EBodySide side : kBodySides)
     {
         Watch(body.Arm(side).upperArm);
         Watch(body.Leg(side).thigh);
     }
-    if (!ShowsBody(rest))
-        PlanFrames();
 }
 
 CBodyPoses::~CBodyPoses()
@@ -59,6 +59,8 @@ CBodyPoses::~CBodyPoses()
 
 void CBodyPoses::Watch(CNode* node)
 {
+    if (m_kFrames.empty()) // nothing will be posed
+        return;
     m_kSampler.Watch(node);
     for (; node && std::ranges::find(m_kKept, node, &Kept::node) == m_kKept.end();
          node = node->GetParentNode())

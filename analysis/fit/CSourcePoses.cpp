@@ -56,7 +56,7 @@ Mat3 CSourcePoses::Facing(size_t stance) const
 Mat3 CSourcePoses::BoneTurn(size_t stance, int joint) const
 {
     const CBoneMesh* mesh = FindBoneMesh(*tree_.Node(joint));
-    const Mat3& turn = tree_.Stances().Turn(stance, joint);
+    const Mat3 turn = tree_.Stances().Turn(stance, joint);
     return mesh ? NormalizedRows(mesh->m_kMatrix) * turn : turn;
 }
 

@@ -1,8 +1,8 @@
 // Chooses a bone map for a source. Every map is matched against the source's bone names. If only the first
-// choice is needed, maps whose first rows name a missing bone are skipped, which is nearly all of them. If
-// none fits as it is, the maps are tried again with the source's name prefix in place of their own. Maps that
-// fit are then judged by the geometry of the joints (JudgeProfile), which costs far more than matching, and
-// sorted.
+// choice is needed, maps whose first rows name a missing bone are skipped, which is nearly all of them, and
+// so are those with fewer rows than one that fits. If none fits as it is, the maps are tried again with the
+// source's name prefix in place of their own. Maps that fit are then judged by the geometry of the joints
+// (JudgeProfile), which costs far more than matching, and sorted.
 
 #include "ChooseProfile.h"
 
@@ -31,42 +31,40 @@ namespace {
 class CSkeletons
 {
 public:
-    CSkeletons(CNode& source, CNode& target)
-        : source_(source), m_kTargetNodes(target), m_kSourceNames(&source), m_kTargetNames(&target)
+    CSkeletons(const CBoneNames& sources, const CBoneNames& targets)
+        : sources_(sources), targets_(targets), m_kTargetNodes(*targets.Root())
     {
     }
 
     void Match(ProfileChoice& choice) const;
     void Judge(ProfileChoice& choice);
-    const CBoneNames& Sources() const { return m_kSourceNames; }
-    const std::vector<std::string>& SourceNames() const { return m_kSourceNames.Names(); }
+    const CBoneNames& Sources() const { return sources_; }
+    const std::vector<std::string>& SourceNames() const { return sources_.Names(); }
 
 private:
     // Analysis that needs several poses is delayed until a profile fits.
     SourceBody& Body()
     {
         if (!body_)
-            body_.emplace(source_);
+            body_.emplace(*sources_.Root());
         return *body_;
     }
 
-    CNode& source_;
+    const CBoneNames& sources_;
+    const CBoneNames& targets_;
     CNodeNames m_kTargetNodes;
-    CBoneNames m_kSourceNames;
-    CBoneNames m_kTargetNames;
     std::optional<SourceBody> body_;
 };
 
 void CSkeletons::Match(ProfileChoice& choice) const
 {
-    CRetargeter table;
-    choice.match = ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, &table);
+    choice.match = ApplyRows(choice.profile.rows, sources_, targets_, nullptr);
 }
 
 void CSkeletons::Judge(ProfileChoice& choice)
 {
     CRetargeter table;
-    ApplyRows(choice.profile.rows, m_kSourceNames, m_kTargetNames, &table);
+    ApplyRows(choice.profile.rows, sources_, targets_, &table);
     choice.verdict = JudgeProfile(table, m_kTargetNodes, Body());
 }
 
@@ -149,26 +147,44 @@ bool AnyFits(const std::vector<ProfileChoice>& choices)
     return std::ranges::any_of(choices, [](const ProfileChoice& choice) { return choice.match.IsWhole(); });
 }
 
+ProfileChoice Read(const LoadedProfile& profile, const CSkeletons& skeletons)
+{
+    ProfileChoice choice{profile.path, RowsOfText(profile.text), false, {}, {}};
+    skeletons.Match(choice);
+    return choice;
+}
+
 std::vector<ProfileChoice> ReadAll(std::span<const LoadedProfile> profiles, const CSkeletons& skeletons)
 {
     std::vector<ProfileChoice> choices;
     choices.reserve(profiles.size()); // growing would copy all rows
     for (const LoadedProfile& profile : profiles)
-    {
-        choices.push_back({profile.path, RowsOfText(profile.text), false, {}, {}});
-        skeletons.Match(choices.back());
-    }
+        choices.push_back(Read(profile, skeletons));
     return choices;
 }
 
-// Reads only the profiles that can fit completely.
+// Reads only the profiles that can fit completely and be the first choice. Profiles with equally many rows
+// keep their order.
 std::vector<ProfileChoice> ReadPromising(std::span<const LoadedProfile> profiles, const CSkeletons& skeletons)
 {
-    std::vector<LoadedProfile> promising;
-    std::ranges::copy_if(profiles, std::back_inserter(promising), [&](const LoadedProfile& profile) {
-        return MayFit(profile.text, skeletons.Sources());
-    });
-    return ReadAll(promising, skeletons);
+    std::multimap<size_t, const LoadedProfile*, std::greater<>> byRows;
+    for (const LoadedProfile& profile : profiles)
+    {
+        if (const std::optional<size_t> rows = RowsThatMayFit(profile.text, skeletons.Sources()))
+            byRows.emplace(*rows, &profile);
+    }
+    std::vector<ProfileChoice> choices;
+    choices.reserve(byRows.size());
+    size_t enough = 0; // the rows of the best profile that fits
+    for (const auto& [most, profile] : byRows)
+    {
+        if (most < enough)
+            break;
+        choices.push_back(Read(*profile, skeletons));
+        const RowMatch& match = choices.back().match;
+        enough = std::max(enough, match.IsWhole() ? static_cast<size_t>(match.rowCount) : 0);
+    }
+    return choices;
 }
 
 } // namespace
@@ -183,13 +199,13 @@ std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNo
         if (std::string text; ReadProfileText(path, text))
             profiles.push_back({path, texts.emplace_back(std::move(text))});
     }
-    return ChooseProfile(profiles, sourceRoot, targetRoot, judged);
+    return ChooseProfile(profiles, CBoneNames(&sourceRoot), CBoneNames(&targetRoot), judged);
 }
 
-std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, CNode& sourceRoot,
-                                         CNode& targetRoot, EJudged judged)
+std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, const CBoneNames& sources,
+                                         const CBoneNames& targets, EJudged judged)
 {
-    CSkeletons skeletons(sourceRoot, targetRoot);
+    CSkeletons skeletons(sources, targets);
     std::vector<ProfileChoice> choices;
     if (judged == EJudged::First)
         choices = ReadPromising(profiles, skeletons);

@@ -42,7 +42,8 @@ enum class EJudged : uint8_t
 /// come first, marked as adapted. Unreadable files are left out.
 std::vector<ProfileChoice> ChooseProfile(std::span<const std::string> paths, CNode& sourceRoot,
                                          CNode& targetRoot, EJudged judged = EJudged::All);
-std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, CNode& sourceRoot,
-                                         CNode& targetRoot, EJudged judged = EJudged::All);
+/// The same for profiles that were read and skeletons whose names were listed. Both have roots.
+std::vector<ProfileChoice> ChooseProfile(std::span<const LoadedProfile> profiles, const CBoneNames& sources,
+                                         const CBoneNames& targets, EJudged judged = EJudged::All);
 
 } // namespace gw

@@ -1,14 +1,16 @@
 // Profiles as rows in memory, as loading them in the editor would leave them, and variants with another name
-// prefix. MayFit stops at the first missing bone, which makes choosing among many profiles cheap.
+// prefix. RowsThatMayFit stops at the first missing bone, which makes choosing among many profiles cheap.
 
 #include "ProfileRows.h"
 
 #include "FindBone.h"
+#include "HostBones.h"
 #include "ProfileFile.h"
 #include "SharedPrefix.h"
 #include "Text.h"
 
 #include <algorithm>
+#include <functional>
 #include <vector>
 
 namespace gw {
@@ -29,7 +31,7 @@ void TakeLine(const ProfileLine& line, ProfileRows& profile)
         break;
     case EProfileLine::Fixed:
     case EProfileLine::Mapping:
-        profile.rows.AddRow(line.source, line.target, line.numbers, ERowColumns::All);
+        profile.rows.AddRow(line.source, line.target, line.Numbers(), ERowColumns::All);
         break;
     }
 }
@@ -56,23 +58,29 @@ ProfileRows RowsOfText(std::string_view text)
     return profile;
 }
 
-bool MayFit(std::string_view text, const CBoneNames& sources)
+std::optional<size_t> RowsThatMayFit(std::string_view text, const CBoneNames& sources)
 {
     CProfileReader reader(text);
-    std::vector<std::string> targets; // a second row for the same target does not change its source
-    const auto isKnown = [&](const std::string& target) {
+    std::vector<std::string_view> targets;
+    const auto isKnown = [&](std::string_view target) {
         return std::ranges::any_of(targets,
-                                   [&](const std::string& known) { return EqualNoCase(known, target); });
+                                   [&](std::string_view known) { return EqualNoCase(known, target); });
     };
+    bool allFit = true;
     for (ProfileLine line; reader.Next(line);)
     {
         if (line.kind != EProfileLine::Mapping && line.kind != EProfileLine::Fixed)
             continue;
-        if (!EqualNoCase(line.source, kFixedSource) && !sources.Find(line.source))
-            return isKnown(line.target);
-        targets.push_back(std::move(line.target));
+        if (allFit && !EqualNoCase(line.source, kFixedSource) && !sources.Find(line.source))
+        {
+            if (!isKnown(line.target)) // a second row for the same target does not change its source
+                return std::nullopt;
+            allFit = false;
+        }
+        targets.push_back(line.target);
     }
-    return true;
+    const auto added = std::ranges::count_if(kPelvisBones, std::not_fn(isKnown));
+    return targets.size() + static_cast<size_t>(added);
 }
 
 std::string TextOf(const ProfileRows& profile)

@@ -5,6 +5,7 @@
 #include "Vec3.h"
 
 #include <cstddef>
+#include <optional>
 #include <string>
 #include <string_view>
 
@@ -27,9 +28,10 @@ struct ProfileRows
 bool ReadProfileRows(const std::string& path, ProfileRows& profile);
 /// Reads a profile from text.
 ProfileRows RowsOfText(std::string_view text);
-/// Returns false if a profile names a source bone that does not exist, so not all rows can fit. Most profiles
-/// name one in their first rows, and reading stops there. Rarely returns true for such a profile too.
-bool MayFit(std::string_view text, const CBoneNames& sources);
+/// Returns the most rows that a profile can have, or nothing if it names a source bone that does not exist,
+/// so not all rows can fit. Most profiles name one in their first rows, and reading stops there. Rarely
+/// returns a number for such a profile too.
+std::optional<size_t> RowsThatMayFit(std::string_view text, const CBoneNames& sources);
 /// Returns the bytes of a file that reads as this profile.
 std::string TextOf(const ProfileRows& profile);
 

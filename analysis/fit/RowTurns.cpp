@@ -95,18 +95,20 @@ double AngleBetweenRotations(const Mat3& a, const Mat3& b)
 // Returns where the source's bone points, in the body's own axes; nothing if joints coincide.
 std::optional<Vec3> Direction(const Lead& lead, const CBodyPoses& poses, const Mat3& toBody)
 {
+    if (lead.next.empty())
+        return std::nullopt;
+    const Vec3 from = poses.Place(*lead.from);
     Vec3 sum = kVec3Zero;
     for (const CNode* node : lead.next)
-        sum = sum + (poses.Place(*node) - poses.Place(*lead.from));
+        sum = sum + (poses.Place(*node) - from);
     const Vec3 direction = Vec3Normalized(sum);
     if (direction == kVec3Zero)
         return std::nullopt;
     return TransformCoord(direction, Mat4Compose(toBody, kVec3Zero));
 }
 
-double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses)
+double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses, const Mat3& toBody)
 {
-    const Mat3 toBody = Mat3Transpose(poses.Axes());
     const Mat3 offset = OffsetRotation(table.OffsetAngles(lead.target), table.OffsetMatrix(lead.target));
     const Mat3 turned = offset * NormalizedRows(poses.BoneWorld(*lead.source)) * toBody;
     // At rest the target is aligned to the axes: left is x, up is y.
@@ -142,8 +144,9 @@ std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& ta
     for (size_t pose = 0; pose < poses.Count(); ++pose)
     {
         poses.Take(pose);
+        const Mat3 toBody = Mat3Transpose(poses.Axes());
         for (size_t i = 0; i < leads.size(); ++i)
-            turns[i].degrees += Turn(leads[i], table, poses) / static_cast<double>(poses.Count());
+            turns[i].degrees += Turn(leads[i], table, poses, toBody) / static_cast<double>(poses.Count());
     }
     return turns;
 }

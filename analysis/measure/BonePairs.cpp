@@ -37,9 +37,9 @@ bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* res
         if (pair.target && pair.source)
             SetPair(pairs, pair);
         else if (!pair.source)
-            missing.push_back({ESkeletonSide::Source, line.source, {}, 0, line.line});
+            missing.push_back({ESkeletonSide::Source, std::string(line.source), {}, 0, line.line});
         else
-            missing.push_back({ESkeletonSide::Target, line.target, {}, 0, line.line});
+            missing.push_back({ESkeletonSide::Target, std::string(line.target), {}, 0, line.line});
     }
     return true;
 }

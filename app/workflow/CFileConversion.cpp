@@ -23,6 +23,8 @@ CFileConversion::CFileConversion(const std::string& dataFolder, const Conversion
                                  NoticeListener listener)
     : platform_(EPlatformWriting::No, dataFolder), choices_(choices), notify_(std::move(listener))
 {
+    // Only the source's: the target's lowest point is put on the floor.
+    motion_.boneMeshes = EBoneMeshes::Empty;
 }
 
 std::string CFileConversion::Message(int id) const
@@ -42,6 +44,7 @@ void CFileConversion::TellMessage(int id) const
 bool CFileConversion::LoadSource(const std::string& path)
 {
     sourcePath_ = path;
+    sourceNames_.reset();
     isScene_ = HasExtension(path, kSceneExtension);
     const bool loaded = isScene_ ? LoadSourceScene(path, scene_, sourceRecord_) : motion_.Load(path);
     if (!isScene_)
@@ -60,6 +63,16 @@ CNode* CFileConversion::SourceRoot() const
     return isScene_ ? FirstNode(scene_.GetRoot(0)) : motion_.motionRoot.Get();
 }
 
+const CBoneNames& CFileConversion::SourceNames()
+{
+    return sourceNames_ ? *sourceNames_ : sourceNames_.emplace(SourceRoot());
+}
+
+const CBoneNames& CFileConversion::TargetNames()
+{
+    return targetNames_ ? *targetNames_ : targetNames_.emplace(result_.motionRoot.Get());
+}
+
 SourceTiming CFileConversion::Timing() const
 {
     return isScene_ ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(motion_);
@@ -68,6 +81,7 @@ SourceTiming CFileConversion::Timing() const
 bool CFileConversion::LoadTarget()
 {
     const std::string path = DataFile(kTargetFile);
+    targetNames_.reset();
     const bool loaded = result_.Load(path);
     Notify(path, result_.Record());
     return loaded;
@@ -131,7 +145,7 @@ bool CFileConversion::Prepare(EAlignedJoints joints)
     {
         WarnOfNumbers();
         retargeter.SetScenes(source, target);
-        const RowMatch match = ApplyRows(profile_.rows, CBoneNames(source), CBoneNames(target), &retargeter);
+        const RowMatch match = ApplyRows(profile_.rows, SourceNames(), TargetNames(), &retargeter);
         fits = match.foundCount == match.rowCount;
         retargeter.LoadShares(DataFile(kShareFile));
     }

@@ -5,6 +5,7 @@
 #include "CMotionFile.h"
 #include "COrrinStream.h"
 #include "CRetargeter.h"
+#include "FindBone.h"
 #include "ProfileRows.h"
 
 #include <optional>
@@ -46,6 +47,9 @@ public:
     bool WriteAligned(const std::string& path);
 
     CNode* SourceRoot() const;
+    /// Returns the names of the source's and the target's bones, listed when first needed.
+    const CBoneNames& SourceNames();
+    const CBoneNames& TargetNames();
     SourceTiming Timing() const;
     /// Returns what drove the last conversion: the source, or its aligned copy.
     CNode* DrivingRoot() const;
@@ -86,6 +90,8 @@ private:
     CMotionFile result_;
     ProfileRows profile_;
     std::string profilePath_;
+    std::optional<CBoneNames> sourceNames_;
+    std::optional<CBoneNames> targetNames_;
     std::optional<CRetargeter> retargeter_; // new for each conversion, like the next member
     std::optional<CConversion> conversion_;
 };

@@ -31,7 +31,7 @@ struct ReadRows
 
     void Add(const ProfileLine& line)
     {
-        rows.AddRow(line.source, line.target, line.numbers, ERowColumns::All);
+        rows.AddRow(line.source, line.target, line.Numbers(), ERowColumns::All);
         isWhole = isWhole && !line.source.empty() && !line.target.empty();
     }
 

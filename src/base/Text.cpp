@@ -109,9 +109,14 @@ size_t EditDistance(std::string_view a, std::string_view b)
     return row.back();
 }
 
-std::string_view NextToken(std::string_view& rest, const CByteSet& set)
+bool IsBlank(char c)
 {
-    const auto separates = [&set](char c) { return set.Has(c); };
+    return c == ' ' || (c >= '\t' && c <= '\r');
+}
+
+template <class F>
+std::string_view NextPart(std::string_view& rest, F separates)
+{
     const auto begin = std::ranges::find_if_not(rest, separates);
     const auto end = std::find_if(begin, rest.end(), separates);
     const std::string_view token(begin, end);
@@ -147,13 +152,12 @@ std::string_view CutTrailing(std::string_view text)
 
 std::string_view NextToken(std::string_view& rest, std::string_view delimiters)
 {
-    return NextToken(rest, CByteSet(delimiters));
+    return NextPart(rest, [set = CByteSet(delimiters)](char c) { return set.Has(c); });
 }
 
 std::string_view NextWord(std::string_view& rest)
 {
-    constexpr CByteSet kSet(kBlanks);
-    return NextToken(rest, kSet);
+    return NextPart(rest, IsBlank);
 }
 
 bool NextLine(std::string_view& rest, std::string_view& line)

@@ -3,6 +3,7 @@
 #include "ContentFixture.h"
 
 #include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
 #include "CFileConversion.h"
 #include "CProfileEditorDialog.h"
 #include "FindBone.h"
@@ -155,6 +156,9 @@ TEST_F(ContentTest, AContainerConverts)
     CFileConversion alone(m_kFolder.Path("data/"), {}, [](const Notice&) {});
     ASSERT_TRUE(alone.LoadSource(m_kFolder.Path("scene.orn")));
     EXPECT_TRUE(FindBoneMesh(*alone.SourceRoot())) << "without a window too: it tells how the bone points";
+    ASSERT_TRUE(alone.LoadTarget());
+    const CNode* const root = FindBone(alone.Result().motionRoot.Get(), "LowerTorso");
+    EXPECT_FALSE(FindBoneMesh(*root)->XYZBuffer().empty()) << "the lowest point is put on the floor";
 }
 
 TEST_F(ContentTest, AProfileThatDoesNotFitStopsTheConversion)

@@ -1,5 +1,7 @@
 """Which profile a conversion takes when none is named, and what is told of it."""
 import json
+import os
+import shutil
 
 from harness import ASSETS, DONE, FAILED, CliTest, main
 from made import body
@@ -19,6 +21,20 @@ class Choice(CliTest):
                 self.assertEqual(told["profilePath"], str(ASSETS / "HumanIK03.prf"))
                 self.assertEqual((told["sureness"], told["doubts"], told["warnings"]), ("sure", [], []))
                 self.assertEqual(self.read("a.htr"), self.read("plain.htr"))
+
+    def test_an_older_map_of_the_same_size_is_read_itself(self):
+        data = self.folder / "data"
+        shutil.copytree(ASSETS, data)
+        installed = data / "HumanIK03.prf"
+        text = installed.read_bytes()
+        self.write("data/profiles.pack", b"HumanIK03.prf %d\n" % len(text) + text)
+        installed.write_bytes(text.replace(b"FrameRate 30", b"FrameRate 60"))
+        os.utime(installed, (1, 1))
+        self.write("a.bvh", body())
+        for choice in ((), ("--profile", STRAIGHT)):
+            done = self.run_program("convert", "a.bvh", "-o", "a.htr", "--force", "--data-dir", data, *choice)
+            self.assertEqual(done.code, DONE, done.err)
+            self.assertIn(b"NumFrames 6", self.read("a.htr").splitlines()[:8], "half as many as with the packed rate")
 
     def test_a_doubtful_profile_is_taken_only_by_name(self):
         self.write("a.bvh", body(swapped=True))

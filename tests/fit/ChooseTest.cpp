@@ -91,13 +91,14 @@ TEST_F(Choose, MoreRowsGoFirstThenTheOrderGivenThenWhatFitsInPart)
     const std::vector<std::string> paths = {
         Profile("half", chest + "Skull <---> Head 0,0,0,1,2,3\n"),
         Profile("few", ""),
+        Profile("tail", chest + "Neck <---> Head 0\nNeck <---> Tail 0\nSpine <---> Tip 0\n"),
         Profile("first", chest),
         m_kFolder.Path("none.prf"),
         Profile("second", chest),
         Profile("third", "Bone1 <---> Head 0\nBone2 <---> Neck 0\nBone3 <---> LHand 0\n"),
     };
     EXPECT_THAT(Names(Of(body.Root(), paths)),
-                testing::ElementsAre("first", "second", "few", "half", "third"));
+                testing::ElementsAre("first", "second", "few", "tail", "half", "third"));
 }
 
 TEST_F(Choose, AProfileWithoutTheRootBoneFitsNothing)

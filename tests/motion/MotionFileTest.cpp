@@ -1,5 +1,7 @@
 // The facade: which stream a name chooses, what a failed call leaves, and what a locale may not change.
 
+#include "BoneMeshQueries.h"
+#include "CBoneMesh.h"
 #include "MotionTexts.h"
 #include "Paths.h"
 #include "Skeleton.h"
@@ -54,6 +56,28 @@ TEST(CMotionFile, EveryPrefixIsTakenOrRefused)
             const bool loaded = motion.Load(folder.Path(name));
             EXPECT_NE(loaded, static_cast<bool>(motion.Record().Failure())) << length << " bytes of " << name;
             EXPECT_TRUE(!loaded || IsFinite(*motion.motionRoot)) << length << " bytes of " << name;
+        }
+    }
+}
+
+TEST(CMotionFile, EmptyBonesAreAsLongAsDrawnOnes)
+{
+    for (const auto& [name, text] :
+         {std::pair{"a.bvh", kSmallBVH}, {"a.htr", kSmallHTR}, {"a.cha", kSmallCHA}})
+    {
+        SCOPED_TRACE(name);
+        const CLoadedMotion drawn(text, name);
+        CMotionFile empty;
+        empty.boneMeshes = EBoneMeshes::Empty;
+        ASSERT_TRUE(empty.Load(drawn.path));
+        const std::vector<CNode*> bones = NodesOf(*drawn.motion.motionRoot);
+        const std::vector<CNode*> others = NodesOf(*empty.motionRoot);
+        for (size_t i = 0; i < bones.size(); ++i)
+        {
+            EXPECT_EQ(NodeBoneLength(*bones[i]), NodeBoneLength(*others[i]));
+            EXPECT_EQ(NodeBoneEnd(*bones[i]), NodeBoneEnd(*others[i]));
+            EXPECT_NE(FindBoneMesh(*bones[i])->XYZBuffer().empty(),
+                      FindBoneMesh(*others[i])->XYZBuffer().empty());
         }
     }
 }

@@ -17,14 +17,14 @@ std::string Describe(const ProfileLine& line)
     const auto three = [](auto a, auto b, auto c) {
         return std::to_string(int(a)) + ',' + std::to_string(int(b)) + ',' + std::to_string(int(c));
     };
-    const std::string number = std::to_string(line.line) + ' ';
+    std::string number = std::to_string(line.line) + ' ';
     if (line.kind == EProfileLine::FrameRate)
         return number + "rate " + std::to_string(line.frameRate);
     if (line.kind == EProfileLine::Position)
         return number + "at " + three(line.position.x, line.position.y, line.position.z);
-    const auto& [rotation, axes] = line.numbers;
-    return number + line.source + '>' + line.target + ' ' + three(rotation[0], rotation[1], rotation[2]) +
-           ' ' + three(axes[0], axes[1], axes[2]);
+    const auto [rotation, axes] = line.Numbers();
+    return number.append(line.source).append(">").append(line.target) + ' ' +
+           three(rotation[0], rotation[1], rotation[2]) + ' ' + three(axes[0], axes[1], axes[2]);
 }
 
 // Returns all lines after the name, each followed by "; ".

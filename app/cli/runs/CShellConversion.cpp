@@ -67,15 +67,17 @@ bool CShellConversion::Open(const std::string& path)
 // Selects the first stock profile that fits.
 void CShellConversion::PickStockProfile()
 {
-    const CBoneNames sources(SourceRoot());
-    const CBoneNames targets(Result().motionRoot.Get());
+    InstalledProfiles();
     for (const char* file : kLongKnown)
     {
-        ProfileRows stock;
-        const bool isRead = ReadProfileRows(DataFile(file), stock);
-        const RowMatch match = ApplyRows(stock.rows, sources, targets, nullptr);
-        const bool fits = isRead && match.foundCount == match.rowCount && match.mappedCount > 0;
-        if (const std::string path = fits ? FindProfile(stock.name) : ""; !path.empty())
+        const std::span<const CProfileTexts::Entry> stock = m_kTexts.front().Entries();
+        const auto found = std::ranges::find(stock, file, &CProfileTexts::Entry::file);
+        if (found == stock.end() || !found->text || !RowsThatMayFit(*found->text, SourceNames()))
+            continue;
+        const RowMatch match =
+            ApplyRows(RowsOfText(*found->text).rows, SourceNames(), TargetNames(), nullptr);
+        const bool fits = match.foundCount == match.rowCount && match.mappedCount > 0;
+        if (const std::string path = fits ? FindProfile(found->name) : ""; !path.empty())
         {
             UseProfile(path);
             return;
@@ -104,10 +106,14 @@ const std::vector<InstalledProfile>& CShellConversion::InstalledProfiles()
 // Keeps the first profile of each name.
 void CShellConversion::ReadInstalled(const std::string& folder, bool stock)
 {
+    const std::span<const CProfileTexts::Entry> entries = m_kTexts.emplace_back(folder, pack_).Entries();
+    if (entries.empty())
+        return;
     std::unordered_set<std::string> names;
     for (const InstalledProfile& profile : *installed_)
         names.insert(LowerCase(profile.name));
-    for (const CProfileTexts::Entry& entry : m_kTexts.emplace_back(folder).Entries())
+    installed_->reserve(installed_->size() + entries.size());
+    for (const CProfileTexts::Entry& entry : entries)
     {
         if (names.insert(LowerCase(entry.name)).second)
             installed_->push_back({entry.name, folder + entry.file, stock, entry.text});
@@ -157,17 +163,31 @@ std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
             return std::ranges::find(known, profile.path) - known.begin();
         };
     std::ranges::stable_sort(profiles, {}, rank);
-    std::vector<ProfileChoice> choices =
-        ChooseProfile(std::span<const LoadedProfile>(profiles), *SourceRoot(), *Result().motionRoot, judged);
+    std::vector<ProfileChoice> choices = ChooseProfile(profiles, SourceNames(), TargetNames(), judged);
     const auto pick = std::ranges::find(choices, ProfilePath(), &ProfileChoice::path);
     if (pick != choices.end())
         std::rotate(choices.begin(), pick, pick + 1);
     return choices;
 }
 
+// Returns false if a profile was chosen by a packed text that its file no longer has.
+bool CShellConversion::IsAsInFile(const std::string& profilePath)
+{
+    const auto profile = std::ranges::find(InstalledProfiles(), profilePath, &InstalledProfile::path);
+    std::string text;
+    return ReadProfileText(profilePath, text) && text == profile->text;
+}
+
 bool CShellConversion::SelectFitting()
 {
-    const std::vector<ProfileChoice> choices = Choices(EJudged::First);
+    std::vector<ProfileChoice> choices = Choices(EJudged::First);
+    if (!choices.empty() && !IsAsInFile(choices.front().path))
+    {
+        pack_ = CProfileTexts::EPack::Ignored;
+        installed_.reset();
+        m_kTexts.clear();
+        choices = Choices(EJudged::First);
+    }
     if (!choices.empty() && choices.front().match.IsWhole())
         return Take(choices.front());
     nearest_.emplace();

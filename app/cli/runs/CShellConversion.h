@@ -61,11 +61,13 @@ private:
     std::string FindProfile(const std::string& name);
     void PickStockProfile();
     bool SelectFitting();
+    bool IsAsInFile(const std::string& profilePath);
     void WarnOfStockPick() const;
     bool Take(const ProfileChoice& choice);
 
     const ShellOptions& options_;
     const CShellNotices& notices_;
+    CProfileTexts::EPack pack_ = CProfileTexts::EPack::Used;
     std::deque<CProfileTexts> m_kTexts;                      ///< of the folders of installed profiles
     std::optional<std::vector<InstalledProfile>> installed_; ///< set when first needed
     std::optional<ProfileChoice> chosen_;

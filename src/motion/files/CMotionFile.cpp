@@ -96,6 +96,7 @@ bool CMotionFile::Load(const std::string& path)
     if (const StreamRow* row = FindStream(path))
     {
         const auto stream = row->make();
+        stream->boneMeshes = boneMeshes;
         const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
         m_kRecord = stream->m_kRecord;
         if (!stream->IsSourceWhole())

@@ -5,6 +5,7 @@
 #include "CNode.h"
 #include "CTextLines.h"
 #include "HTRPose.h"
+#include "MotionNode.h"
 
 #include <functional>
 #include <string>
@@ -49,6 +50,7 @@ public:
     Ref<CNode> motionRoot; ///< the animated tree
     int fileVersion = 1;
     EQuarterTurns quarterTurns = EQuarterTurns::Flipped; ///< how Save writes them
+    EBoneMeshes boneMeshes = EBoneMeshes::Drawn;         ///< how Load makes them
 
 protected:
     /// Maps a text file and rewinds. Returns false for an empty path or a file that cannot be read.

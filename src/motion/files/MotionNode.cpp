@@ -34,7 +34,8 @@ CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, cons
     return *track;
 }
 
-CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length)
+CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length,
+                      EBoneMeshes meshes)
 {
     CBoneMesh* mesh = nullptr;
     if (childCount > 1)
@@ -43,7 +44,10 @@ CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, f
         mesh = new CBoneShapeMesh;
     node.AttachChild(mesh);
     mesh->SetName(name.c_str());
-    mesh->Build(length);
+    if (meshes == EBoneMeshes::Drawn)
+        mesh->Build(length);
+    else if (length > 0.0f)
+        mesh->m_fLength = length;
     return *mesh;
 }
 

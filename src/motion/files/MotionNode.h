@@ -35,9 +35,17 @@ bool KeyTimesFit(int64_t frameCount, size_t nodeCount, size_t fileBytes, size_t 
 /// and a rest matrix.
 CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, const Mat4& restMatrix);
 
+/// How bone meshes are made. A bone has its length and direction either way.
+enum class EBoneMeshes : uint8_t
+{
+    Drawn,
+    Empty, ///< without points, for a source that is not shown
+};
+
 /// Gives a node a bone mesh with a name and length: a ball if the bone has more than one child, otherwise a
 /// tapered bone. A length of 0 or below leaves the mesh empty.
-CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length);
+CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, float length,
+                      EBoneMeshes meshes = EBoneMeshes::Drawn);
 
 /// Adds a new child to a node.
 CNode& AttachNode(CNode& parent);

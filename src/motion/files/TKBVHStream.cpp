@@ -186,7 +186,7 @@ void TKBVHStream::AddBoneShape(const TKBVHFile&, const TKBVHJoint& joint, CNode&
 {
     if (joint.children.empty())
         return;
-    CBoneMesh& mesh = AttachBone(node, joint.name, joint.children.size(), LongestOffset(joint));
+    CBoneMesh& mesh = AttachBone(node, joint.name, joint.children.size(), LongestOffset(joint), boneMeshes);
     mesh.m_kEnd = EndOf(joint);
     if (joint.children.size() == 1)
         mesh.m_kMatrix = Mat4Compose(BoneTurn(joint.children[0]->offset), kVec3Zero);

@@ -36,7 +36,7 @@ bool TKCHAStream::BuildAnimatedTree(TKCHFile& file)
 
 void TKCHAStream::AddBoneShape(const TKCHFile&, const TKCHSegment& segment, CNode& node)
 {
-    AttachBone(node, segment.name, segment.children.size(), segment.length);
+    AttachBone(node, segment.name, segment.children.size(), segment.length, boneMeshes);
 }
 
 } // namespace gw

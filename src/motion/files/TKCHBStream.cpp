@@ -167,7 +167,7 @@ bool TKCHBStream::BuildAnimatedTree(TKCHFile& file)
 
 void TKCHBStream::AddBoneShape(const TKCHFile&, const TKCHSegment& segment, CNode& node)
 {
-    AttachBone(node, segment.name, segment.children.size(), segment.length);
+    AttachBone(node, segment.name, segment.children.size(), segment.length, boneMeshes);
 }
 
 void TKCHBStream::ReadKeyword(std::string_view keyword, Line line)

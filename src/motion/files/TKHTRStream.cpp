@@ -120,7 +120,7 @@ void TKHTRStream::FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment,
 
 void TKHTRStream::AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
 {
-    CBoneMesh& mesh = AttachBone(node, segment.name, segment.children.size(), segment.boneLength);
+    CBoneMesh& mesh = AttachBone(node, segment.name, segment.children.size(), segment.boneLength, boneMeshes);
     mesh.m_kMatrix = Mat4Compose(UpAxisMatrix(file.boneLengthAxis), kVec3Zero);
 }
 

@@ -76,17 +76,27 @@ void CStances::AddPose()
 {
     Places& places = m_kPlaces.emplace_back();
     Places& tips = m_kTips.emplace_back();
-    std::vector<Mat3>& turns = m_kTurns.emplace_back();
+    std::vector<Mat3>& axes = m_kAxes.emplace_back();
     places.reserve(Joints().size());
     tips.reserve(Joints().size());
-    turns.reserve(Joints().size());
+    axes.reserve(Joints().size());
     for (size_t joint = 0; joint < Joints().size(); ++joint)
     {
         const Mat4& world = Joints()[joint]->m_kWorldMatrix;
         places.push_back(world.Translation());
         tips.push_back(TransformCoord(m_kLocalTips[joint], world));
-        turns.push_back(NormalizedRows(world));
+        Mat3& own = axes.emplace_back();
+        for (int row = 0; row < 3; ++row)
+            own.SetRow(row, world.Row(row));
     }
+}
+
+Mat3 CStances::Turn(size_t stance, int joint) const
+{
+    Mat3 turn = m_kAxes[stance][static_cast<size_t>(joint)];
+    for (int row = 0; row < 3; ++row)
+        turn.SetRow(row, Vec3Normalized(turn.Row(row)));
+    return turn;
 }
 
 } // namespace gw

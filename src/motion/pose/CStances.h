@@ -36,7 +36,7 @@ public:
     const Vec3& Tip(size_t stance, int joint) const { return m_kTips[stance][static_cast<size_t>(joint)]; }
 
     /// Returns the rotation of a joint in a pose, from its own space to world space.
-    const Mat3& Turn(size_t stance, int joint) const { return m_kTurns[stance][static_cast<size_t>(joint)]; }
+    Mat3 Turn(size_t stance, int joint) const;
 
 private:
     using Places = std::vector<Vec3>;
@@ -47,7 +47,7 @@ private:
     Places m_kLocalTips; // in the joint's space
     std::vector<Places> m_kPlaces;
     std::vector<Places> m_kTips;
-    std::vector<std::vector<Mat3>> m_kTurns;
+    std::vector<std::vector<Mat3>> m_kAxes; // with the scale: Turn is rarely asked
 };
 
 } // namespace gw
