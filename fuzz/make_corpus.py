@@ -75,10 +75,11 @@ def motions():
     yield "bvh", {"small": made.BVH, "walk": walk, "wave": wave,
                   "commas": made.bvh("1 90 0 0", "1, 90.5 ,-0 0"), "crlf": made.BVH.replace("\n", "\r\n"),
                   "endless": made.bvh("    End Site\n    {\n      OFFSET 0 5 0\n    }\n", "")}
-    yield "htr", {"small": made.HTR, "radians": made.htr("RotationUnits Degrees", "RotationUnits Radians"),
-                  "order": made.htr("EulerRotationOrder ZYX", "EulerRotationOrder XYZ")}
-    yield "cha", {"small": made.CHA}
-    yield "chb", {"small": made.chb(), "old": made.chb(100)}
+    yield "htr", {"small": made.HTR, "radians": made.HTR.replace("Units Degrees", "Units Radians"),
+                  "order": made.HTR.replace("Order ZYX", "Order XYZ")}
+    yield "cha", {"small": made.page_file("tiny.cha")}
+    chb = made.page_file("tiny.chb")
+    yield "chb", {"small": chb, "old": chb.replace(struct.pack("<i", 721), struct.pack("<i", 100), 1)}
     ways = {"plain": 0, "packaged": 2, "feet": 4, "all": 2 | 8 | 16 | 32 | 64}
     converts = {"walk-" + what: bytes([way]) + walk.encode() for what, way in ways.items()}
     converts["scene"] = b"\1" + made.one_bone_scene()

@@ -29,16 +29,6 @@ TEST_F(ContentTest, Clicks)
     }
 }
 
-TEST_F(ContentTest, CtrlOnOpenNeverShowsTheFileDialog)
-{
-    m_kWindow.m_kKeys = {EKey::LeftCtrl};
-    m_kContent.ChildClick("open");
-    EXPECT_EQ(m_kWindow.TakeCalls(), Calls{"folder in "});
-    m_kWindow.m_kKeys = {EKey::LeftShift};
-    m_kContent.ChildClick("open");
-    EXPECT_EQ(m_kWindow.TakeCalls(), Calls{"open *.bvh in "});
-}
-
 TEST_F(ContentTest, TheClockRunsBothViewsUntilTheSourceStops)
 {
     OpenAndConvert();
@@ -67,31 +57,6 @@ TEST_F(ContentTest, TheResultsOwnTimerMovesNothing)
     EXPECT_EQ(m_kWindow.TakeCalls(), Calls{"kill 1"});
 }
 
-TEST_F(ContentTest, DraggingThePlaybarHoldsTheClock)
-{
-    OpenAndConvert();
-    m_kContent.ChildMouseDown("|playbar");
-    m_kContent.ChildScroll("|PLAYBAR", 256);
-    m_kContent.ChildMouseUp("|playbar");
-    m_kContent.ChildMouseDown("play");
-    EXPECT_EQ(m_kWindow.TakeCalls(), (Calls{"kill 0", "timer 0 17"}));
-    EXPECT_FALSE(m_kWindow.m_kEnabled["end"]);
-    EXPECT_FALSE(m_kWindow.m_kEnabled["end1"]);
-}
-
-TEST_F(ContentTest, TheEditorShowsAndHides)
-{
-    m_kWindow.m_bButtonState = true;
-    m_kContent.ChildClick("%adv");
-    EXPECT_TRUE(m_kContent.ProfileEditor()->IsVisible());
-    m_kWindow.m_bButtonState = false;
-    m_kContent.ChildClick("%adv");
-    EXPECT_FALSE(m_kContent.ProfileEditor()->IsVisible());
-    m_kContent.ProfileEditor()->Show();
-    m_kContent.UpdateControls();
-    EXPECT_TRUE(m_kWindow.m_bButtonState);
-}
-
 TEST_F(ContentTest, SelectedBonesAreHighlighted)
 {
     Open(Write("walk.bvh", BvhText(kPoserBones)));
@@ -115,7 +80,7 @@ TEST_F(ContentTest, HelpIsTheHostsFileOrAPage)
     EXPECT_EQ(click(), Calls{page}) << "a host without its library";
     Write("host/Kbel.dll", ResourceFile({}));
     EXPECT_EQ(click(), Calls{"help ::/Using_Gaitwright.htm"}) << "a library that names no file";
-    Write("host/Kbel.dll", ResourceFile({{32824, 0, "Kestro.chm"}}));
+    Write("host/Kbel.dll", ResourceFile({{32824, 0, u"Kestro.chm"}}));
     EXPECT_EQ(click(), Calls{page}) << "a file that is not there";
     Write("host/Kestro.chm", "");
     EXPECT_EQ(click(), Calls{"help " + m_kFolder.Path("host/Kestro.chm::/Using_Gaitwright.htm")});

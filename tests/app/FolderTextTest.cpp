@@ -35,13 +35,6 @@ TEST(FolderText, NamesAFolderByBothSeparators)
     EXPECT_EQ(FolderOfText("takes", "/"), "/takes/");
 }
 
-TEST(FolderText, IsShownWithoutItsLastSeparator)
-{
-    EXPECT_EQ(FolderName("/home/ann/"), "/home/ann");
-    EXPECT_EQ(FolderName("/"), "/");
-    EXPECT_EQ(FolderName(""), "");
-}
-
 std::vector<std::string> Told(std::string_view filter)
 {
     std::vector<std::string> told;

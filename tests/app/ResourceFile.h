@@ -10,7 +10,7 @@ struct ResourceString
 {
     uint32_t id;
     uint32_t language;
-    std::string text; ///< UTF-8, at most three bytes per character
+    std::u16string text;
 };
 
 /// Returns the bytes of a 64-bit library that contains only a string table.

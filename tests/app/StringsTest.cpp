@@ -8,7 +8,6 @@
 #include "StringTable.h"
 
 #include <gtest/gtest.h>
-#include <random>
 #include <set>
 #include <tuple>
 
@@ -22,13 +21,13 @@ constexpr uint32_t kFrench = 1036;
 std::string Library()
 {
     return ResourceFile({
-        {138, kFrench, "Fichier invalide."},
-        {138, kGerman, "Ungültige Datei. \xe2\x82\xac"},
-        {139, kGerman, "*"},
-        {144, 0, "Neutral"},
-        {144, kFrench, "Profil!"},
-        {171, kGerman, "*no text in the table either"},
-        {4711, kGerman, "new"},
+        {138, kFrench, u"Fichier invalide."},
+        {138, kGerman, u"Ungültige Datei. \u20ac"},
+        {139, kGerman, u"*"},
+        {144, 0, u"Neutral"},
+        {144, kFrench, u"Profil!"},
+        {171, kGerman, u"*no text in the table either"},
+        {4711, kGerman, u"new"},
     });
 }
 
@@ -69,21 +68,6 @@ TEST(StringLibrary, EveryPrefixIsRefusedOrGivesTheText)
         std::string text;
         const bool found = FindResourceString(std::as_bytes(std::span(cut)), 138, kGerman, text);
         EXPECT_EQ(text, found ? "Ungültige Datei. \xe2\x82\xac" : "") << size;
-    }
-}
-
-TEST(StringLibrary, NoByteInTheFileIsTrusted)
-{
-    const std::string whole = Library();
-    std::mt19937 random(1);
-    for (int round = 0; round < 20000; ++round)
-    {
-        std::vector<char> bytes(whole.begin(), whole.end());
-        for (int i = 0; i < 3; ++i)
-            bytes[random() % bytes.size()] = static_cast<char>(random() % 4 == 0 ? 0xff : random());
-        std::string text;
-        FindResourceString(std::as_bytes(std::span(bytes)), 138, kGerman, text);
-        EXPECT_LE(text.size(), 3 * bytes.size());
     }
 }
 

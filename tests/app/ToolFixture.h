@@ -3,6 +3,7 @@
 #include "CGaitToolDialog.h"
 
 #include "ContentFixture.h"
+#include "FindBone.h"
 #include "Paths.h"
 
 #include <algorithm>
@@ -103,8 +104,7 @@ protected:
     }
     CNode* Bone(EToolMotion motion, const char* name) const
     {
-        CNode* const root = m_kTool.Motion(motion).motionRoot.Get();
-        return root ? static_cast<CNode*>(root->FindObject(name, &CNode::ms_kRTTI, true)) : nullptr;
+        return FindBone(m_kTool.Motion(motion).motionRoot.Get(), name);
     }
     /// Returns the world matrix of a result bone at a frame.
     Mat4 ResultAt(const char* name, int frame)

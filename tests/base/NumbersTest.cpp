@@ -51,17 +51,11 @@ CRead ReadFront(const CBlock& block)
     return {value, static_cast<size_t>(next - block.bytes.data()), kind};
 }
 
-std::string Fixed6(float value)
+template <class F>
+std::string Appended(F append, float value)
 {
     std::string text;
-    AppendFixed6(text, value);
-    return text;
-}
-
-std::string Fixed3(float value)
-{
-    std::string text;
-    AppendFixed3(text, value);
+    append(text, value);
     return text;
 }
 
@@ -221,8 +215,8 @@ TEST(Numbers, FloatsPrintAsTheLibraryPrintsThem)
     {
         for (const float v : {value, -value, std::nextafter(value, 0.0f), std::nextafter(value, kInfinity)})
         {
-            EXPECT_EQ(Fixed6(v), Printed(v));
-            EXPECT_EQ(Fixed3(v), Printed(v, 3));
+            EXPECT_EQ(Appended(AppendFixed6, v), Printed(v));
+            EXPECT_EQ(Appended(AppendFixed3, v), Printed(v, 3));
         }
     }
     std::mt19937_64 random(2);

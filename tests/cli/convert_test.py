@@ -4,7 +4,7 @@ import os
 import shlex
 import unittest
 
-from harness import ASSETS, DONE, FAILED, WALK, CliTest, main
+from harness import ASSETS, FAILED, WALK, CliTest, main
 from made import BVH, bvh, profile
 
 OLD = b"an older result"
@@ -13,18 +13,15 @@ OLD = b"an older result"
 REFUSED = [  # what, arguments behind "convert", words on standard error
     ("an output that exists", "walk.bvh -o old.Kinetra", ["old.Kinetra", "--force"]),
     ("the default output exists", "old.bvh", ["old.Kinetra", "--force"]),
-    ("an .htr that exists", "walk.bvh -o old.HTR", ["old.htr", "--force"]),
     ("a folder as output, even by force", "walk.bvh -o folder.Kinetra --force", ["folder.Kinetra", "folder"]),
     ("no such source", "none.bvh -o a.Kinetra", ["none.bvh", "cannot be opened"]),
     ("a source of an unknown kind", "made.prf -o a.Kinetra", ["made.prf", ".bvh"]),
     ("no folder for the output", "walk.bvh -o none/a.Kinetra", ["none/a.Kinetra", "cannot be written"]),
-    ("a file where the folder should be", "walk.bvh -o old.bvh/a.htr", ["cannot be written"]),
     ("a slip in a profile's name", "walk.bvh -o a.htr --profile \"Poser BHV\"", ["Poser BHV", '"Poser BVH"']),
     ("no such profile file", "walk.bvh -o a.htr --profile none.prf", ["none.prf", "cannot be read"]),
     ("a profile for other bones", "walk.bvh -o a.htr --profile made.prf",
      ["Unable to convert", '"Made": 3 of 5 rows match', 'line 4: the source has no bone "hipp"',
       'the closest is "hip"', 'line 5: the source has no bone "Xyzzy"']),
-    ("a profile without the root bone", "walk.bvh -o a.htr --profile rootless.prf", ["rootless.prf", "root bone"]),
     ("bones that no profile knows", "strange.bvh -o a.htr", ["strange.bvh", "no installed profile fits", 'no bone "hip"']),
     ("a motion without frames", "still.bvh -o a.htr --profile small.prf", ["no frames"]),
     ("no target skeleton", "walk.bvh -o a.htr --data-dir nothing", ["base.htr"]),
@@ -41,7 +38,6 @@ class Convert(CliTest):
             self.write(name, OLD)
         (self.folder / "folder.Kinetra").mkdir()
         self.write("made.prf", profile("Made", [("hipp", "LowerTorso"), ("Xyzzy", "Waist"), ("neck", "Neck")]))
-        self.write("rootless.prf", profile("Rootless", [("neck", "Neck")]))
         self.write("small.prf", profile("Small", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")]))
         self.write("small.bvh", BVH)
         self.write("strange.bvh", bvh("ROOT Hips", "ROOT Alpha").replace("JOINT Chest", "JOINT Beta"))
@@ -93,39 +89,26 @@ class Convert(CliTest):
         count = [len(self.read(name).splitlines()) for name in ("stock.htr", "mine.htr")]
         self.assertGreater(count[0], 1.5 * count[1])  # 120 / rate frames for each
 
-    def test_without_legs_the_feet_differ_and_nothing_else(self):
-        self.succeed("convert", "walk.bvh", "-o", "with.htr")
-        self.succeed("convert", "walk.bvh", "-o", "without.htr", "--no-legs")
-        nodes = [json.loads(self.run_program("pose", name, "--frame", 40).out)["nodes"]
-                 for name in ("with.htr", "without.htr")]
-        changed = {a["name"] for a, b in zip(*nodes) if a["local"] != b["local"]}
-        self.assertTrue(changed)
-        self.assertLessEqual(changed, {"LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
-
-    def test_a_faithful_result_keeps_to_the_source_and_differs_in_trunk_and_legs_alone(self):
-        for name, options in (("plain.htr", []), ("faithful.htr", ["--faithful"])):
-            self.succeed("convert", "walk.bvh", "-o", name, *options)
-        nodes = [json.loads(self.run_program("pose", name, "--frame", 40).out)["nodes"]
-                 for name in ("plain.htr", "faithful.htr")]
-        changed = {a["name"] for a, b in zip(*nodes) if a["local"] != b["local"]}
-        self.assertEqual(changed, {"LowerTorso", "Waist", "UpperTorso", "Neck", "LCollar", "RCollar",
-                                   "LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"})
-        measures = json.loads(self.succeed("compare", "walk.bvh", "faithful.htr", "--profile", "Poser BVH",
-                                           "--json").out)
-        self.assertAlmostEqual(measures["travelRatio"], 1, delta=0.01)
-        for bone in measures["bones"]:
-            if bone["target"][1:] in ("Thigh", "Calf"):
-                self.assertLess(bone["meanError"], 1, bone["target"])
-
-    def test_without_hands_the_arms_of_a_faithful_result_differ_and_nothing_else(self):
-        self.write("wave.bvh", WALK.with_name("wave.bvh").read_bytes())
-        for name, options in (("with.htr", []), ("without.htr", ["--no-hands"])):
-            self.succeed("convert", "wave.bvh", "-o", name, "--profile", "Max BVH", "--align", "--faithful", *options)
-        sections = [dict(part.split("]", 1) for part in self.read(name).decode().split("[")[1:])
-                    for name in ("with.htr", "without.htr")]
-        changed = {name for name in sections[0] if sections[0][name] != sections[1][name]}
-        self.assertTrue(changed)
-        self.assertLessEqual(changed, {side + bone for side in "LR" for bone in ("UpperArm", "Forearm", "Hand")})
+    def test_a_switch_changes_certain_bones_and_no_others(self):
+        legs = {side + bone for side in "LR" for bone in ("Thigh", "Calf", "Foot")}
+        arms = {side + bone for side in "LR" for bone in ("UpperArm", "Forearm", "Hand")}
+        trunk = {"LowerTorso", "Waist", "UpperTorso", "Neck", "LCollar", "RCollar"}
+        wave = ["--profile", "Max BVH", "--align", "--faithful"]
+        rows = [  # switch, source, other options, bones
+            ("--no-legs", "walk.bvh", [], legs),
+            ("--faithful", "walk.bvh", [], legs | trunk),
+            ("--no-hands", "wave.bvh", wave, arms),
+        ]
+        for switch, source, options, bones in rows:
+            with self.subTest(switch):
+                self.write(source, WALK.with_name(source).read_bytes())
+                sections = []
+                for name, further in (("plain.htr", []), ("other.htr", [switch])):
+                    self.succeed("convert", source, "-o", name, "--force", *options, *further)
+                    sections.append(dict(part.split("]", 1) for part in self.read(name).decode().split("[")[1:]))
+                changed = {name for name in sections[0] if sections[0][name] != sections[1][name]}
+                self.assertTrue(changed)
+                self.assertLessEqual(changed, bones)
 
     def test_a_result_that_cannot_fit_is_refused_before_the_work(self):
         self.write("slow.prf", profile("Slow", [("Hips", "LowerTorso")], rate=1))  # 120 rows for each frame
@@ -136,12 +119,9 @@ class Convert(CliTest):
         self.assert_words(result, ["long.bvh: the result would take at least", "split the motion"])
 
     @unittest.skipIf(os.geteuid() == 0, "root may write everywhere")
-    def test_a_folder_that_takes_no_file_is_said(self):
+    def test_a_folder_that_cannot_be_listed_is_said(self):
         locked = self.folder / "locked"
-        locked.mkdir(mode=0o500)
-        self.assertEqual(self.with_assets("convert", "walk.bvh", "-o", "locked/a.Kinetra").code, FAILED)
-        self.assertEqual(self.made(), [])
-        locked.chmod(0o300)  # nor can it be listed
+        locked.mkdir(mode=0o300)
         for command in (["convert", "locked", "--out-dir", "out"], ["batch", "locked", "--job", "htr"]):
             self.assert_words(self.with_assets(*command), ["locked", "the folder cannot be read"])
 

@@ -5,7 +5,7 @@ import struct
 import unittest
 from pathlib import Path
 
-from harness import ASSETS, DATA, DONE, FAILED, CliTest, main
+from harness import DATA, DONE, CliTest, main
 from poses import Htr, worst_difference
 
 DATA = Path(DATA) if DATA else None
@@ -97,18 +97,6 @@ class Golden(NumbersTest):
                     self.assertEqual(self.run_program("transcode", folder / "source.bvh", name).code, DONE)
                     self.assert_same_numbers(numbers((self.folder / name).read_text()),
                                              numbers((folder / "transcoded.bvh").read_text()), 0.001)
-
-
-@unittest.skipUnless(DATA, "no real motions beside the project")
-class Real(CliTest):
-
-    def test_what_a_stock_profile_fits_is_converted_without_a_word_from_the_user(self):
-        fitting = {"poser_boxing": "Poser BVH", "mocapbank_lefthip": "Max BVH"}
-        for stem, profile in fitting.items():
-            with self.subTest(stem):
-                result = self.run_program("convert", DATA / "bvh" / (stem + ".bvh"), "-o", stem + ".htr",
-                                          "--data-dir", ASSETS, "--json")
-                self.assertEqual(json.loads(result.out)["profile"], profile)
 
 
 @unittest.skipUnless(DATA, "no containers beside the project")

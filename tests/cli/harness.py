@@ -1,6 +1,5 @@
 """Runs the program as its users do: arguments in, exit code, two texts and files out."""
 import os
-import resource
 import shutil
 import subprocess
 import tempfile
@@ -35,14 +34,10 @@ class CliTest(unittest.TestCase):
             if name.endswith("SAN_OPTIONS"):
                 self.environment[name] = value
 
-    def run_program(self, *arguments, program=PROGRAM, file_limit=None, stdout=subprocess.PIPE):
-        """Runs in the test's folder. A file limit in bytes stands for a full disk."""
-        def limit():
-            resource.setrlimit(resource.RLIMIT_FSIZE, (file_limit, file_limit))
-
+    def run_program(self, *arguments, program=PROGRAM, stdout=subprocess.PIPE):
+        """Runs in the test's folder."""
         done = subprocess.run([program, *map(str, arguments)], cwd=self.folder, env=self.environment,
-                              stdin=subprocess.DEVNULL, stdout=stdout, stderr=subprocess.PIPE, timeout=SECONDS,
-                              preexec_fn=limit if file_limit is not None else None)
+                              stdin=subprocess.DEVNULL, stdout=stdout, stderr=subprocess.PIPE, timeout=SECONDS)
         if done.stdout is None:
             done.stdout = b""
         self.assertIn(done.returncode, (DONE, FAILED, USAGE), done.stderr[-2000:])

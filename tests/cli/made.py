@@ -1,5 +1,12 @@
 """Small files that the tests make themselves."""
 import struct
+import sys
+from pathlib import Path
+
+PROJECT = Path(__file__).resolve().parents[2]
+PAGES = PROJECT / "docs" / "formats"
+sys.path.append(str(PROJECT / "tests" / "docs"))
+from page import content_of, read_page  # noqa: E402
 
 # Two joints, three frames: the least that has a tree, rows and an end.
 BVH = """HIERARCHY
@@ -26,37 +33,13 @@ Frame Time: 0.0333333
 """
 
 
-HTR = """[Header]
-FileType htr
-DataType HTRS
-FileVersion 1
-NumSegments 2
-NumFrames 2
-DataFrameRate 30
-EulerRotationOrder ZYX
-CalibrationUnits mm
-RotationUnits Degrees
-GlobalAxisofGravity Y
-BoneLengthAxis Y
-ScaleFactor 1.000000
-[SegmentNames&Hierarchy]
-#CHILD\tPARENT
-Hips GLOBAL
-Chest Hips
-[BasePosition]
-#SegmentName Tx, Ty, Tz, Rx, Ry, Rz, BoneLength
-Hips 0 90 0 0 0 0 10
-Chest 0 10 0 0 0 0 5
-[Hips]
-#Fr Tx Ty Tz Rx Ry Rz SF
-1 0 0 0 0 0 0 1
-2 1 0 0 0 0 90 1
-[Chest]
-#Fr Tx Ty Tz Rx Ry Rz SF
-1 0 0 0 0 0 0 1
-2 0 0 0 0 0 0 1
-[EndOfFile]
-"""
+def page_file(name):
+    """Returns the bytes of the small file that the page on its format shows."""
+    parts = read_page(PAGES / (name.split(".")[1] + ".md"))
+    return next(content_of(part) for part in parts if getattr(part, "file", "") == name)
+
+
+HTR = page_file("tiny.htr").decode()
 
 
 def bvh(old, new):
@@ -68,8 +51,9 @@ def bvh(old, new):
 def body(prefix="", spine=3, swapped=False, family="Spine"):
     """A human body in a T-pose that looks along z, in cm, by the names that most recorders give. Swapped, the
     left names lie on the right. The other family calls its spine Chest and its limbs by their joints."""
-    arm, leg = {"Spine": (("Shoulder", "Arm", "ForeArm", "Hand"), ("UpLeg", "Leg", "Foot", "ToeBase")),
-                "Chest": (("Collar", "Shoulder", "Elbow", "Wrist"), ("Hip", "Knee", "Ankle", "Toe"))}[family]
+    names = {"Spine": "Shoulder Arm ForeArm Hand UpLeg Leg Foot ToeBase",
+             "Chest": "Collar Shoulder Elbow Wrist Hip Knee Ankle Toe"}[family].split()
+    limbs = [(4, 14, 0), (14, 0, 0), (28, 0, 0), (26, 0, 0), (9, -4, 0), (0, -42, 0), (0, -42, 0), (0, -7, 13)]
 
     def joint(name, offset, *below):
         text = "JOINT %s%s\n{\nOFFSET %g %g %g\nCHANNELS 3 Zrotation Xrotation Yrotation\n" % (prefix, name, *offset)
@@ -82,72 +66,20 @@ def body(prefix="", spine=3, swapped=False, family="Spine"):
             below = (joint(name, offset, *below),)
         return below[0]
 
-    def sides(names, offsets):
+    def sides(part):
         for side in (1, -1):
             word = "Left" if (side == 1) != swapped else "Right"
-            yield chain([word + name for name in names], [(side * x, y, z) for x, y, z in offsets])
+            yield chain([word + name for name in names[part]], [(side * x, y, z) for x, y, z in limbs[part]])
 
-    top = [*sides(arm, [(4, 14, 0), (14, 0, 0), (28, 0, 0), (26, 0, 0)]),
-           chain(["Neck", "Head"], [(0, 20, 0), (0, 9, 0)])]
-    first = 0 if family == "Spine" else 1
+    top = [*sides(slice(4)), chain(["Neck", "Head"], [(0, 20, 0), (0, 9, 0)])]
     for number in reversed(range(spine)):
-        name = family if number == 0 else "%s%d" % (family, number + first)
+        name = family + (str(number + (family == "Chest")) if number else "")
         top = [joint(name, (0, 30 / spine, 0), *top)]
-    legs = sides(leg, [(9, -4, 0), (0, -42, 0), (0, -42, 0), (0, -7, 13)])
-    hips = joint("Hips", (0, 0, 0), *legs, *top).replace("JOINT", "ROOT", 1)
+    hips = joint("Hips", (0, 0, 0), *sides(slice(4, 8)), *top).replace("JOINT", "ROOT", 1)
     hips = hips.replace("CHANNELS 3", "CHANNELS 6 Xposition Yposition Zposition", 1)
     count = hips.count("CHANNELS")
     row = "0 95 0" + " 0 0 0" * count + "\n"
     return "HIERARCHY\n" + hips + "MOTION\nFrames: 3\nFrame Time: 0.0333333\n" + 3 * row
-
-
-def htr(old, new):
-    assert HTR.count(old) >= 1, old
-    return HTR.replace(old, new, 1)
-
-
-# The same two joints, turned and moved as in BVH, one frame more: the end of a CHA is one before its last.
-CHA = """[HEADER]
-VersionNumber 100
-DataFrameRate 30
-BeginFrame 0
-EndFrame 3
-NumSegments 2
-
-[LENGTH]
-Hips 10
-Chest 5
-[HIERARCHY]
-Hips Global
-Chest Hips
-[MOTION]
-"""
-MATRICES = [(0, 90, 0, (1, 0, 0, 0, 1, 0, 0, 0, 1)), (1, 90, 0, (0, 1, 0, -1, 0, 0, 0, 0, 1)),
-            (2, 90, 0, (0, 0, -1, 0, 1, 0, 1, 0, 0)), (3, 90, 0, (1, 0, 0, 0, 1, 0, 0, 0, 1))]
-for number, (x, y, z, chest) in enumerate(MATRICES):
-    CHA += "Frame %d\nHips 1, 0, 0, 0, 1, 0, 0, 0, 1, %d, %d, %d\n" % (number, x, y, z)
-    CHA += "Chest %s, 0, 10, 0\n" % ", ".join(map(str, chest))
-
-
-def cha(old, new):
-    assert CHA.count(old) >= 1, old
-    return CHA.replace(old, new, 1)
-
-
-def chb(version=721, frames=MATRICES):
-    """The same in binary."""
-    def name(text):
-        return text.encode().ljust(256, b"\0")
-
-    header = [("VersionNumber", version), ("DataFrameRate", 30), ("BeginFrame", 0), ("EndFrame", len(frames) - 1),
-              ("NumSegments", 2)]
-    made = b"[HEADER]" + b"".join(key.encode() + struct.pack("<i", value) for key, value in header)
-    made += b"[LENGTH]" + name("Hips") + struct.pack("<f", 10) + name("Chest") + struct.pack("<f", 5)
-    made += b"[HIERARCHY]" + name("Hips") + name("Global") + name("Chest") + name("Hips") + b"[MOTION]"
-    for number, (x, y, z, chest) in enumerate(frames):
-        made += b"Frame" + struct.pack("<i12f", number, 1, 0, 0, 0, 1, 0, 0, 0, 1, x, y, z)
-        made += struct.pack("<12f", *chest, 0, 10, 0)
-    return made
 
 
 def profile(name, rows, rate=30):

@@ -6,7 +6,7 @@ import unittest
 from pathlib import Path
 
 from harness import DATA, DONE, CliTest, main
-from made import BVH, IDENTITY, Container, moved
+from made import IDENTITY, Container, moved
 
 
 def spatial(matrix):
@@ -80,12 +80,6 @@ class Objects(CliTest):
         self.assertEqual(self.pose("scene.orn", -1.0)["objects"][1]["points"], [[1, 5, 0], [-1, 5, 0]])
         told = json.loads(self.run_program("pose", "scene.orn", "--time", "4").out)
         self.assertEqual(told["nodes"][0]["world"], moved(2, 0, 0))
-
-    def test_a_motion_has_objects_too(self):
-        self.write("take.bvh", BVH)
-        told = json.loads(self.run_program("pose", "take.bvh", "--frame", "1", "--objects").out)
-        self.assertEqual([told["frame"], told["objects"][0]["name"]], [1, "Hips"])
-        self.assertIn("CBoneShapeMesh", [o["class"] for o in told["objects"]])
 
     @unittest.skipUnless(DATA and (Path(DATA) / "scenes").is_dir(), "no shared data here")
     def test_scenes_agree_with_another_evaluation(self):

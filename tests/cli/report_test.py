@@ -3,7 +3,7 @@ import json
 import xml.etree.ElementTree as ElementTree
 
 from harness import DONE, FAILED, ROOT, USAGE, WALK, CliTest, main
-from made import BVH, profile
+from made import BVH
 
 WAVE = ROOT / "examples" / "wave.bvh"
 POSER = ["--profile", "Poser BVH"]
@@ -22,20 +22,14 @@ class ReportTest(CliTest):
         self.assertNotIn("http", text)
         return ElementTree.fromstring(text)
 
-    def texts(self, page, tag="td"):
-        return ["".join(cell.itertext()).strip() for cell in page.iter(tag)]
-
-
 class Check(ReportTest):
     def test_a_result_is_measured_as_compare_measures_its_file(self):
-        bent = WAVE.read_text().replace("OFFSET 0.0000 -7.0000 15.0000", "OFFSET 4.0000 -12.0000 8.0000")
-        self.write("bent.bvh", bent)  # feet that do not rest as the target's do
         hierarchy, motion = WAVE.read_text().split("MOTION")
-        head = motion.split("\n")[:3]  # and an arm that is turned by a quarter, as an .htr has it wrong
+        head = motion.split("\n")[:3]  # an arm that is turned by a quarter, as an .htr has it wrong
         row = "0 92 0" + " 0 0 0" * 5 + " 0 0 90 0 90 0" + " 0 0 0" * (hierarchy.count("CHANNELS") - 7)
         self.write("quarter.bvh", hierarchy + "MOTION" + "\n".join(head).replace("Frames: 90", "Frames: 9") +
                    ("\n" + row) * 9 + "\n")
-        for source, name, *options in ((WALK, "Poser BVH"), ("bent.bvh", "Max BVH"), ("quarter.bvh", "Max BVH"),
+        for source, name, *options in ((WALK, "Poser BVH"), ("quarter.bvh", "Max BVH"),
                                        ("quarter.bvh", "Max BVH", "--align")):
             with self.subTest(source, options=options):
                 told = lines(self.succeed("convert", source, "-o", "a.htr", "--profile", name, "--force", "--check",
@@ -78,22 +72,6 @@ class Check(ReportTest):
 
 
 class Page(ReportTest):
-    def test_the_page_has_the_figures_of_the_comparison(self):
-        self.succeed("convert", WALK, "-o", "a.Kinetra", *POSER)
-        plain = self.succeed("compare", WALK, "a.Kinetra", *POSER).out
-        compared = self.succeed("compare", WALK, "a.Kinetra", *POSER, "--html", "page.html")
-        self.assertEqual(compared.out, plain)
-        figures = json.loads(self.succeed("compare", WALK, "a.Kinetra", *POSER, "--json").out)
-        cells = self.texts(self.page())
-        for bone in figures["bones"]:
-            if not bone["measured"]:
-                continue
-            row = cells.index(bone["target"], cells.index("LowerTorso"))
-            self.assertEqual(cells[row + 1], bone["source"])
-            self.assertAlmostEqual(float(cells[row + 2]), bone["meanError"], delta=6e-4)
-            self.assertAlmostEqual(float(cells[row + 3]), bone["largestError"], delta=6e-4)
-        pops = cells.index("knee pops")
-        self.assertEqual(cells[pops + 1:pops + 3], [str(foot["kneePops"]) for foot in figures["feet"]])
 
     def test_a_page_that_cannot_be_is_refused_before_the_work(self):
         self.write("page.html", OLD)
@@ -116,9 +94,6 @@ class Page(ReportTest):
         self.write("page.html", OLD)
         self.succeed("convert", WALK, "-o", "a.htr", *POSER)
         before = self.files()
-        result = self.with_assets("compare", WALK, "a.htr", *POSER, "--html", "page.html", "--force", file_limit=9000)
-        self.assertEqual(result.code, FAILED)
-        self.assert_words(result, ["page.html", "cannot be written"])
         self.environment["TMPDIR"] = str(self.folder / "none")  # where a page's parts wait
         result = self.with_assets("compare", WALK, "a.htr", *POSER, "--html", "page.html", "--force")
         self.assert_words(result, ["page.html", "temporary files"])

@@ -137,9 +137,7 @@ class Sources(RunTest):
         names = ["takes/b/t01.bvh", "takes/a/t00.bvh"]
         rows = [  # what, list, options, sources
             ("lines", "\n".join(names) + "\n", [], ["b/t01", "a/t00"]),
-            ("lines of another system", "\r\n\r\n".join(names), [], ["b/t01", "a/t00"]),
             ("zero bytes", "\0".join(names) + "\0", ["-0"], ["b/t01", "a/t00"]),
-            ("one folder", "takes/b/t01.bvh\ntakes/b/t03.bvh\n", [], ["t01", "t03"]),
             ("a folder", "takes/a\n", ["--quiet"], ["a/t%02d" % n for n in range(0, TAKES, 2)]),
             ("a name with a blank", "two words.bvh\n", [], ["two words"]),
         ]
@@ -186,12 +184,6 @@ class Lost(RunTest):
         run = self.start("--jobs", "2", "--keep-going", "--report", "report.jsonl", "--time-limit", "5")
         self.worker_at_slow(run)
         self.assert_lost(self.end(run), "time-limit", "not done within 5 seconds")
-
-    def test_without_keep_going_a_crash_ends_the_run_in_its_place(self):
-        run = self.start("--jobs", "3")
-        self.crash(self.worker_at_slow(run), signal.SIGSEGV)
-        self.assertEqual(self.end(run)[0], FAILED)
-        self.assertEqual(sorted(self.results()), ["a/t%02d.Kinetra" % n for n in range(0, 10, 2)])
 
     def test_an_interrupted_run_ends_whole_and_goes_on_later(self):
         for number in (signal.SIGINT, signal.SIGTERM):
@@ -287,9 +279,7 @@ class Resumed(RunTest):
         self.write("other.jsonl", '{"source":"a.bvh","output":"b.bvh"}\n')
         rows = [  # what, report, options
             ("a motion, resumed", "takes/a/t00.bvh", ["--resume"]),
-            ("a motion, by force", "takes/a/t00.bvh", ["--force"]),
             ("other lines, resumed", "other.jsonl", ["--resume"]),
-            ("a plan, resumed", "plan.jsonl", ["--resume"]),
             ("a plan", "plan.jsonl", []),
         ]
         for what, name, options in rows:

@@ -1,8 +1,9 @@
 """Profiles for skeletons that none fits: what is found, what is told, and that conversions take them."""
+import itertools
 import json
 import re
 
-from harness import DATA, DONE, FAILED, WALK, CliTest, main
+from harness import DATA, FAILED, WALK, CliTest, main
 from made import BVH
 from pathlib import Path
 
@@ -17,33 +18,15 @@ REST_POSES = {
 
 
 def scrambled():
-    """The walk with names that say nothing, and what each was."""
-    names = {}
-
-    def rename(match):
-        new = f"n{len(names):02}q"
-        names[new] = match.group(2)
-        return match.group(1) + new
-
-    return re.sub(r"(ROOT |JOINT )(\w+)", rename, WALK.read_text()), names
+    """The walk with names that say nothing."""
+    numbers = itertools.count()
+    return re.sub(r"(ROOT |JOINT )\w+", lambda match: f"{match[1]}n{next(numbers):02}q", WALK.read_text())
 
 
 class Suggest(CliTest):
-    def test_names_and_shape_lead_to_the_same_profile(self):
-        text, names = scrambled()
-        self.write("strange.bvh", text)
-        self.write("walk.bvh", WALK.read_bytes())
-        by_name = json.loads(self.succeed("suggest", "walk.bvh", "-o", "walk.prf", "--json").out)
-        by_shape = json.loads(self.succeed("suggest", "strange.bvh", "-o", "strange.prf", "--json").out)
-        for named, shaped in zip(by_name["rows"], by_shape["rows"]):
-            self.assertEqual(named["source"], names.get(shaped["source"], ""), named["target"])
-            self.assertEqual(named.get("rotation"), shaped.get("rotation"), named["target"])
-        sure = {row["target"]: row.get("evidence") for row in by_name["rows"]}
-        self.assertEqual({sure[bone] for bone in THIRTEEN}, {"name-and-shape"})
-        self.assertEqual({row.get("evidence") for row in by_shape["rows"] if row["target"] in THIRTEEN}, {"shape"})
 
     def test_a_conversion_takes_the_profile(self):
-        self.write("strange_walk.bvh", scrambled()[0])
+        self.write("strange_walk.bvh", scrambled())
         self.assertEqual(self.with_assets("convert", "strange_walk.bvh", "-o", "a.htr").code, FAILED)
         told = self.succeed("suggest", "strange_walk.bvh", "-o", "new.prf")
         for bone in THIRTEEN:
@@ -79,16 +62,6 @@ class Suggest(CliTest):
         self.assert_words(result, ["old.prf", "--force"])
         self.succeed("suggest", "walk.bvh", "-o", "old.prf", "--force")
         self.assertTrue(self.read("old.prf").startswith(b"walk\n"))
-
-    def test_failures_leave_no_file(self):
-        self.write("walk.bvh", WALK.read_bytes())
-        for what, arguments in (("no source", ("none.bvh", "-o", "a.prf")),
-                                ("no folder", ("walk.bvh", "-o", "none/a.prf")),
-                                ("no target", ("walk.bvh", "-o", "a.prf", "--data-dir", "nothing"))):
-            with self.subTest(what):
-                run = self.run_program if "--data-dir" in arguments else self.with_assets
-                self.assertEqual(run("suggest", *arguments).code, FAILED)
-                self.assertEqual(self.files(), ["walk.bvh"])
 
     def test_real_files_get_whole_profiles(self):
         for path in sorted(Path(DATA, "bvh").glob("*.bvh")) if DATA else []:

@@ -2,20 +2,17 @@
 
 #include "Paths.h"
 #include "QtText.h"
+#include "Widgets.h"
 
 #include <QApplication>
 #include <QComboBox>
-#include <QDropEvent>
-#include <QFileDialog>
 #include <QKeyEvent>
 #include <QLabel>
 #include <QLineEdit>
-#include <QMimeData>
 #include <QOpenGLWidget>
 #include <QPlainTextEdit>
 #include <QPushButton>
 #include <QTest>
-#include <QUrl>
 #include <gtest/gtest.h>
 
 namespace gw {
@@ -78,9 +75,7 @@ void CPerson::Restart()
 
 QWidget* CPerson::Child(const char* name)
 {
-    auto* const child = m_spFrame->findChild<QWidget*>(QString::fromLatin1(name));
-    EXPECT_TRUE(child) << name;
-    return child;
+    return &ChildOf(*m_spFrame, QString::fromLatin1(name));
 }
 
 bool CPerson::IsOn(const char* name)
@@ -144,13 +139,7 @@ void CPerson::Type(int key, Qt::KeyboardModifiers modifiers)
 
 void CPerson::Drop(const std::string& path)
 {
-    QMimeData dropped;
-    dropped.setUrls({QUrl::fromLocalFile(ToQString(path))});
-    QDragEnterEvent enter(QPoint(300, 300), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
-    QApplication::sendEvent(m_spFrame.get(), &enter);
-    ASSERT_TRUE(enter.isAccepted());
-    QDropEvent drop(QPointF(300, 300), Qt::CopyAction, &dropped, Qt::LeftButton, Qt::NoModifier);
-    QApplication::sendEvent(m_spFrame.get(), &drop);
+    EXPECT_TRUE(DropFile(*m_spFrame, *m_spFrame, path));
     Wait(50);
 }
 
@@ -181,19 +170,7 @@ void CPerson::WillAnswer(const char* button)
 
 void CPerson::WillChooseFile(const std::string& path)
 {
-    m_kAnswers.Add([path](QWidget& dialog) {
-        auto* const files = dynamic_cast<QFileDialog*>(&dialog);
-        if (!files)
-            return false;
-        if (path.empty())
-        {
-            files->reject();
-            return true;
-        }
-        files->findChild<QLineEdit*>(QStringLiteral("fileNameEdit"))->setText(ToQString(path));
-        QMetaObject::invokeMethod(files, "accept");
-        return true;
-    });
+    m_kAnswers.Add([path](QWidget& dialog) { return ChooseFile(dialog, path); });
 }
 
 void CPerson::WillChooseFolder(const std::string& folder, int filter)

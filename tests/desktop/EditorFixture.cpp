@@ -43,11 +43,8 @@ void EditorTest::Toggle(bool shown)
 
 void EditorTest::Type(int field, const char* text)
 {
-    auto& edit = Child<QLineEdit>(field);
     Activate(m_kEditor);
-    edit.setFocus();
-    edit.selectAll();
-    QTest::keyClicks(&edit, QString::fromUtf8(text));
+    TypeInto(Child<QLineEdit>(field), QString::fromUtf8(text));
 }
 
 void EditorTest::Press(Qt::Key key, Qt::KeyboardModifiers modifiers)
@@ -66,27 +63,23 @@ void EditorTest::Click(int button)
 void EditorTest::ClickBone(int tree, const std::string& name)
 {
     auto& view = Child<CBoneTreeView>(tree);
-    const auto found = view.findItems(ToQString(name), Qt::MatchExactly | Qt::MatchRecursive);
-    ASSERT_EQ(found.size(), 1) << name;
-    view.scrollToItem(found[0]);
-    QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, view.visualItemRect(found[0]).center());
+    ClickItem(view, ItemOf(view, name));
     Settle();
 }
 
 void EditorTest::ClickRow(int row, Qt::KeyboardModifiers modifiers)
 {
     auto& view = Child<CMapRowView>(kMapRowList);
-    const QPoint at = view.visualRect(view.model()->index(row, 0)).center();
-    QTest::mouseClick(view.viewport(), Qt::LeftButton, modifiers, at);
+    ClickItem(view, view.model()->index(row, 0), modifiers);
     Settle();
 }
 
 void EditorTest::DoubleClickRow(int row)
 {
     auto& view = Child<CMapRowView>(kMapRowList);
-    const QPoint at = view.visualRect(view.model()->index(row, 0)).center();
-    QTest::mouseClick(view.viewport(), Qt::LeftButton, {}, at);
-    QTest::mouseDClick(view.viewport(), Qt::LeftButton, {}, at);
+    const QModelIndex index = view.model()->index(row, 0);
+    ClickItem(view, index);
+    QTest::mouseDClick(view.viewport(), Qt::LeftButton, {}, view.visualRect(index).center());
     Settle();
 }
 
@@ -138,17 +131,6 @@ std::vector<std::string> EditorTest::Rows() const
         rows.push_back(all);
     }
     return rows;
-}
-
-std::vector<std::string> EditorTest::TakeBoxes()
-{
-    std::vector<std::string> boxes;
-    for (const std::string& call : m_kWindow.TakeCalls())
-    {
-        if (call.starts_with("box"))
-            boxes.push_back(call);
-    }
-    return boxes;
 }
 
 std::vector<int> EditorTest::SelectedRows() const

@@ -6,9 +6,9 @@
 #include "CProfileEditorDialog.h"
 #include "CProfileEditorWindow.h"
 #include "ContentFixture.h"
+#include "Widgets.h"
 
 #include <QLabel>
-#include <QLineEdit>
 #include <QPushButton>
 #include <functional>
 #include <string>
@@ -43,14 +43,12 @@ protected:
     template <class Widget>
     Widget& Child(const QString& name) const
     {
-        auto* const child = m_kEditor.findChild<Widget*>(name);
-        EXPECT_TRUE(child) << name.toStdString();
-        return *child;
+        return ChildOf<Widget>(m_kEditor, name);
     }
     template <class Widget>
     Widget& Child(int id) const
     {
-        return Child<Widget>(QString::number(id));
+        return ChildOf<Widget>(m_kEditor, QString::number(id));
     }
     std::string Field(int field) const;
     bool IsEnabled(int button) const;
@@ -60,9 +58,6 @@ protected:
     /// Returns the rows as "hip > LowerTorso 0 0 0", followed by the axes unless they are neutral.
     std::vector<std::string> Rows() const;
     std::vector<int> SelectedRows() const;
-
-    /// Returns the message boxes since the last time, as "box 157".
-    std::vector<std::string> TakeBoxes();
 
     QWidget m_kOwner; ///< in place of the main window
     CProfileEditorWindow m_kEditor{m_kContent, m_kPlatform, &m_kOwner};

@@ -8,6 +8,16 @@
 namespace gw {
 namespace {
 
+// Returns the texts of a row's columns, each followed by a bar.
+template <class F>
+std::string RowText(F textOf)
+{
+    std::string text;
+    for (int column = 0; column < kMapColumnCount; ++column)
+        text += textOf(column) + '|';
+    return text;
+}
+
 /// Keeps a copy of a model's rows like a view: by its change notifications only.
 class CMirror
 {
@@ -34,12 +44,8 @@ private:
     void Take(int first, int last)
     {
         for (int row = first; row <= last; ++row)
-        {
-            std::string text;
-            for (int column = 0; column < kMapColumnCount; ++column)
-                text += model_.index(row, column).data().toString().toStdString() + '|';
-            m_kRows[size_t(row)] = text;
-        }
+            m_kRows[size_t(row)] = RowText(
+                [&](int column) { return model_.index(row, column).data().toString().toStdString(); });
     }
 
     const CMapRowModel& model_;
@@ -50,12 +56,7 @@ std::vector<std::string> RowsOf(const CMapRowTable& table)
 {
     std::vector<std::string> rows;
     for (int row = 0; row < table.RowCount(); ++row)
-    {
-        std::string text;
-        for (int column = 0; column < kMapColumnCount; ++column)
-            text += table.Text(row, column) + '|';
-        rows.push_back(text);
-    }
+        rows.push_back(RowText([&](int column) { return table.Text(row, column); }));
     return rows;
 }
 

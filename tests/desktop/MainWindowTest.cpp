@@ -39,16 +39,9 @@ void OpenAndConvert(CPerson& person)
 
 bool ShowsSomething(const QImage& picture)
 {
-    const QRgb ground = picture.pixel(0, 0);
-    for (int y = 0; y < picture.height(); ++y)
-    {
-        for (int x = 0; x < picture.width(); ++x)
-        {
-            if (picture.pixel(x, y) != ground)
-                return true;
-        }
-    }
-    return false;
+    QImage ground = picture;
+    ground.fill(picture.pixelColor(0, 0));
+    return picture != ground;
 }
 
 void ChooseOption(CPerson& person, int row)
@@ -108,7 +101,7 @@ TEST(MainWindow, AMotionIsOpenedConvertedPlayedAndSaved)
     EXPECT_EQ(ScrollValue(person), paused);
     person.Type(Qt::Key_End);
     EXPECT_EQ(ScrollValue(person), 256);
-    EXPECT_TRUE(person.Place().startsWith(QStringLiteral("frame 66 of 66")));
+    EXPECT_EQ(person.Place(), QStringLiteral("frame 66 of 66   2.20 s"));
     person.Type(Qt::Key_Left);
     EXPECT_TRUE(person.Place().startsWith(QStringLiteral("frame 65 of 66")));
 
@@ -217,12 +210,6 @@ TEST(MainWindow, LeftCtrlOnOpenConvertsAFolder)
     person.ReleaseLeft(EKey::LeftCtrl, nullptr);
     person.WillChooseFile({});
     person.ClickSlowly("open");
-
-    person.WillChooseFolder(folder, 2);
-    person.WillAnswer("ok");
-    person.Drop(folder);
-    EXPECT_EQ(person.m_kBoxes.back(), QStringLiteral("2 HTR files are successful convert to ORN."));
-    EXPECT_TRUE(FileExists(folder + "a.orn"));
 }
 
 TEST(MainWindow, RightKeysAreNotLeftKeys)
@@ -252,15 +239,6 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
     person.Drop(broken);
     EXPECT_EQ(person.m_kBoxes, QStringList{QStringLiteral("Invalid BVH file format.")});
     EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("broken.bvh:2:"));
-
-    std::string twofold = ReadBytes(ExampleFile("walk.bvh"));
-    twofold.insert(twofold.find("Frames:"), 1, '\n');
-    twofold.insert(twofold.find("JOINT ") + 6, "my ");
-    WriteBytes(broken, twofold);
-    person.WillAnswer("ok");
-    person.Drop(broken);
-    EXPECT_THAT(ToUtf8(person.m_kDetails), testing::HasSubstr("contains a space"))
-        << "all that is wrong is told, not just what came first";
     EXPECT_TRUE(person.IsOn("convert")) << "the source before stays";
 }
 

@@ -42,36 +42,24 @@ Act Key(Qt::Key key)
     return [key](QWidget& box) { QTest::keyClick(&box, key); };
 }
 
-TEST(MessageBox, EveryButtonAnswersForItself)
+TEST(MessageBox, AnswersToButtonsKeysAndTheCloseBox)
 {
-    const std::tuple<EButtons, const char*, EAnswer> rows[] = {
-        {EButtons::OK, "ok", EAnswer::OK},
-        {EButtons::OKCancel, "ok", EAnswer::OK},
-        {EButtons::OKCancel, "cancel", EAnswer::Cancel},
-        {EButtons::YesNoCancel, "yes", EAnswer::Yes},
-        {EButtons::YesNoCancel, "no", EAnswer::No},
-        {EButtons::YesNoCancel, "cancel", EAnswer::Cancel},
-        {EButtons::YesNo, "yes", EAnswer::Yes},
-        {EButtons::YesNo, "no", EAnswer::No},
+    const Act close = [](QWidget& box) { box.close(); };
+    const std::tuple<EButtons, std::vector<const char*>, std::vector<EAnswer>> rows[] = {
+        {EButtons::OK, {"ok"}, {EAnswer::OK}},
+        {EButtons::OKCancel, {"ok", "cancel"}, {EAnswer::OK, EAnswer::Cancel}},
+        {EButtons::YesNoCancel, {"yes", "no", "cancel"}, {EAnswer::Yes, EAnswer::No, EAnswer::Cancel}},
+        {EButtons::YesNo, {"yes", "no"}, {EAnswer::Yes, EAnswer::No}},
     };
-    for (const auto& [buttons, name, answer] : rows)
-        EXPECT_EQ(Ask(buttons, Press(name)), answer) << name;
-}
-
-TEST(MessageBox, EnterAnswersFirstAndWhatClosesAnswersMostCarefully)
-{
-    const std::tuple<EButtons, EAnswer, EAnswer> rows[] = {
-        {EButtons::OK, EAnswer::OK, EAnswer::OK},
-        {EButtons::OKCancel, EAnswer::OK, EAnswer::Cancel},
-        {EButtons::YesNoCancel, EAnswer::Yes, EAnswer::Cancel},
-        {EButtons::YesNo, EAnswer::Yes, EAnswer::No},
-    };
-    for (const auto& [buttons, enter, escape] : rows)
+    for (const auto& [buttons, names, answers] : rows)
     {
-        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Return)), enter);
-        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Enter), "Text", "Details"), enter);
-        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Escape)), escape);
-        EXPECT_EQ(Ask(buttons, [](QWidget& box) { box.close(); }), escape);
+        SCOPED_TRACE(names.back());
+        for (size_t i = 0; i < names.size(); ++i)
+            EXPECT_EQ(Ask(buttons, Press(names[i])), answers[i]) << names[i];
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Return)), answers.front());
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Enter), "Text", "Details"), answers.front());
+        EXPECT_EQ(Ask(buttons, Key(Qt::Key_Escape)), answers.back()) << "the most careful one";
+        EXPECT_EQ(Ask(buttons, close), answers.back());
     }
 }
 

@@ -4,6 +4,7 @@
 #include "CSelectFolderDialog.h"
 #include "Paths.h"
 #include "TempFolder.h"
+#include "Widgets.h"
 
 #include <QAbstractButton>
 #include <QAbstractItemView>
@@ -49,15 +50,7 @@ protected:
     std::string Path() { return Child<QLineEdit>("102")->text().toStdString(); }
     void Click(const char* name) { QTest::mouseClick(Child<QWidget>(name), Qt::LeftButton); }
 
-    void Write(const std::string& path)
-    {
-        auto* edit = Child<QLineEdit>("102");
-        edit->setFocus();
-        edit->selectAll();
-        QTest::keyClicks(edit, QString::fromStdString(path));
-        if (path.empty())
-            QTest::keyClick(edit, Qt::Key_Delete);
-    }
+    void Write(const std::string& path) { TypeInto(*Child<QLineEdit>("102"), QString::fromStdString(path)); }
 
     // Waits until the list contains these names, with brackets around those that cannot be selected, and
     // returns its contents.

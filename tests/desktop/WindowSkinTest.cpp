@@ -2,6 +2,7 @@
 #include "Paths.h"
 #include "TempFolder.h"
 
+#include <filesystem>
 #include <gmock/gmock.h>
 #include <tuple>
 
@@ -27,11 +28,7 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
     {
         SCOPED_TRACE(words);
         const CTempFolder folder;
-        for (const char* name : {"bvh.cnt", "bvh.ini", "bvh.qss"})
-            WriteBytes(folder.Path(name), ReadBytes(whole + name));
-        CreateFolder(folder.Path("icons"));
-        for (const std::string& icon : FilesInFolder(whole + "icons/", ".svg"))
-            WriteBytes(folder.Path("icons/" + icon), ReadBytes(whole + "icons/" + icon));
+        std::filesystem::copy(whole, folder.Path(), std::filesystem::copy_options::recursive);
         CSkin skin;
         std::string problem;
         EXPECT_TRUE(skin.Load(folder.Path(), problem)) << problem;

@@ -137,11 +137,6 @@ class Program(unittest.TestCase):
         time.sleep(1)
         self.assertIsNone(after.poll(), "a program that is told to end leaves its place")
 
-    def test_the_map_tool_opens_beside_the_main_window(self):
-        self.home.start()
-        self.wait_for_socket()
-        self.check_map_tool()
-
     def test_a_left_key_that_was_pressed_over_another_program_counts(self):
         lines = [line.split() for line in (FORGE.parent / "Content" / "bvh.cnt").read_text().splitlines()]
         left, top, width, height = next(map(int, line[2:6]) for line in lines if line[:2] == ["button", "open"])

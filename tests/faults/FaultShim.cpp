@@ -22,7 +22,6 @@
 // Allocation functions inside the system's library, under the names that remain when malloc is replaced.
 extern "C" void* __libc_malloc(size_t size);
 extern "C" void* __libc_calloc(size_t count, size_t size);
-extern "C" void* __libc_realloc(void* block, size_t size);
 
 namespace {
 
@@ -144,16 +143,6 @@ int open(const char* path, int flags, ...)
 
 int open64(const char* path, int flags, ...) __attribute__((alias("open")));
 
-std::FILE* fopen(const char* path, const char* mode)
-{
-    if (!IsDue(EOperation::Open))
-        return Next<decltype(fopen)>("fopen")(path, mode);
-    errno = EACCES;
-    return nullptr;
-}
-
-std::FILE* fopen64(const char* path, const char* mode) __attribute__((alias("fopen")));
-
 ssize_t read(int file, void* bytes, size_t count)
 {
     return IsDue(EOperation::Read) ? Refuse(EIO) : syscall(SYS_read, file, bytes, count);
@@ -257,13 +246,6 @@ void* calloc(size_t count, size_t size)
     return nullptr;
 }
 
-void* realloc(void* block, size_t size)
-{
-    if (!IsDue(EOperation::Allocate))
-        return __libc_realloc(block, size);
-    errno = ENOMEM;
-    return nullptr;
-}
 #endif
 
 } // extern "C"

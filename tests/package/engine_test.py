@@ -14,12 +14,8 @@ WALK = ROOT / "examples" / "walk.bvh"
 SECONDS = 120
 
 REFUSED = [  # what, source, profile, output, words
-    ("no such source", "none.bvh", "PoserBVH.prf", "a.Kinetra", "none.bvh"),
-    ("no motion", "empty.bvh", "PoserBVH.prf", "a.Kinetra", "empty.bvh"),
     ("a motion without frames", "still.bvh", "PoserBVH.prf", "a.Kinetra", "no frames"),
-    ("no such profile", "walk.bvh", "none.prf", "a.Kinetra", "none.prf"),
     ("a profile for other bones", "walk.bvh", "Mixamo.prf", "a.Kinetra", "the source has no bone"),
-    ("no folder for the output", "walk.bvh", "PoserBVH.prf", "none/a.Kinetra", "cannot be written"),
 ]
 
 
@@ -38,7 +34,6 @@ class Engine(unittest.TestCase):
         shutil.copy(WALK, cls.folder)
         text = WALK.read_text()
         (cls.folder / "still.bvh").write_text(text[:text.index("Frames:")] + "Frames: 0\nFrame Time: 0.033333\n")
-        (cls.folder / "empty.bvh").touch()
 
     @classmethod
     def run_here(cls, *arguments):

@@ -55,23 +55,4 @@ TEST(MapLines, LinesSayWhatTheirKeySays)
     }
 }
 
-TEST(MapLines, FileHoldsTheLinesAsTheyStand)
-{
-    const CTempFolder folder;
-    const std::string path = folder.Path("map.txt");
-    const std::string written =
-        "Unknown Source\nPosition 1,-2,0\nFrameRate 60\nA <---> Head .\nB <---> Waist 1,-2,3\n";
-    std::vector<MapLine> lines;
-    for (const std::string& text :
-         {std::string("Unknown Source"), PositionLine({1.9f, -2.9f, 0}), FrameRateLine(60),
-          MappingLine("A", "Head"), MappingLine("B", "Waist", {1, -2, 3})})
-        lines.push_back(ParseMapLine(text));
-    ASSERT_TRUE(WriteMapLines(path, lines));
-    EXPECT_EQ(ReadBytes(path), written);
-    ASSERT_TRUE(ReadMapLines(path, lines));
-    EXPECT_EQ(lines.size(), 5u);
-    EXPECT_FALSE(ReadMapLines(folder.Path("none.txt"), lines));
-    EXPECT_EQ(Describe(lines.back()), "B>Waist 1,-2,3") << "left alone";
-}
-
 } // namespace gw

@@ -97,6 +97,12 @@ void ProfileEditor::MakeReadOnly(const std::string& path)
     fs::permissions(path, fs::perms::owner_read);
 }
 
+void ProfileEditor::SetField(int field, const std::string& text)
+{
+    m_kEditor.EditField(field, text);
+    m_kEditor.LeaveField();
+}
+
 void ProfileEditor::SelectBones(const std::string& source, const std::string& target)
 {
     m_kEditor.SelectSourceItem(m_kEditor.FindSourceItem(source));

@@ -56,6 +56,8 @@ protected:
     /// Writes and loads a profile.
     bool Load(const std::string& text) { return m_kEditor.LoadProfile(MakeProfile(text)); }
     void MakeReadOnly(const std::string& path);
+    /// Types into a field and leaves it.
+    void SetField(int field, const std::string& text);
     void SelectBones(const std::string& source, const std::string& target);
     /// Returns the matches of a file, as "1 of 2, fits" or "1 of 2, misfit".
     std::string Count(const std::string& path);

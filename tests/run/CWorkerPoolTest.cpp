@@ -23,7 +23,6 @@ enum class EDeed
     Crash,
     Exit, ///< exits like a program that a sanitizer ends
     Hang,
-    Interrupt, ///< interrupts the program that started it
 };
 
 // Each job writes a file with its number and then acts as configured.
@@ -76,8 +75,6 @@ private:
             std::raise(SIGKILL);
         if (deed == EDeed::Exit)
             _exit(3);
-        if (deed == EDeed::Interrupt)
-            kill(getppid(), SIGINT);
         while (deed == EDeed::Hang)
             pause();
     }
@@ -162,18 +159,6 @@ TEST(CWorkerPool, ARunThatEndsLeavesWhatOneByOneLeaves)
             EXPECT_EQ(ResultCount(folder, 20), deed == EDeed::Bad ? 7u : 6u);
         }
     }
-}
-
-TEST(CWorkerPool, ARequestToEndLetsFinishWhatIsUnderWay)
-{
-    const CTempFolder folder;
-    CDeeds deeds(Deeds(40, 5, EDeed::Interrupt), folder);
-    EXPECT_TRUE(RunDeeds(deeds, 40, 2, ECommit::AtOnce));
-    EXPECT_GE(deeds.taken.size(), 6u);
-    EXPECT_LT(deeds.taken.size(), 40u);
-    EXPECT_EQ(deeds.good, deeds.taken.size());
-    EXPECT_EQ(ResultCount(folder, 40), deeds.taken.size());
-    EXPECT_TRUE(deeds.lost.empty());
 }
 
 } // namespace gw

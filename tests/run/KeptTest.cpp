@@ -7,31 +7,16 @@
 #include "Paths.h"
 #include "TempFolder.h"
 
-#include <fstream>
 #include <gtest/gtest.h>
 #include <tuple>
 
 namespace gw {
-namespace {
-
-void WriteText(const std::string& path, std::string_view text)
-{
-    std::ofstream(path, std::ios::binary) << text;
-}
-
-std::string ReadText(const std::string& path)
-{
-    std::ifstream file(path, std::ios::binary);
-    return {std::istreambuf_iterator<char>(file), {}};
-}
-
-} // namespace
 
 TEST(CContentHash, TellsApartWhichBytesBelongToWhat)
 {
     const CTempFolder folder;
-    WriteText(folder.Path("ab"), "ab");
-    WriteText(folder.Path("empty"), "");
+    WriteBytes(folder.Path("ab"), "ab");
+    WriteBytes(folder.Path("empty"), "");
     const std::string digits[] = {
         CContentHash().AddText("ab").AddText("c").Digits(),
         CContentHash().AddText("a").AddText("bc").Digits(),
@@ -62,11 +47,11 @@ TEST(CReportFile, HalfALineOfADeadWriterIsClosedFirst)
     for (const auto& [what, before, start, after] : rows)
     {
         SCOPED_TRACE(what);
-        WriteText(folder.Path("report"), before);
+        WriteBytes(folder.Path("report"), before);
         CReportFile report;
         ASSERT_TRUE(report.Open(folder.Path("report"), start));
         EXPECT_TRUE(report.AddLine("new"));
-        EXPECT_EQ(ReadText(folder.Path("report")), after); // immediately, not when it is closed
+        EXPECT_EQ(ReadBytes(folder.Path("report")), after); // immediately, not when it is closed
     }
     CReportFile full;
     EXPECT_FALSE(full.Open("/dev/full", CReportFile::EStart::Empty) && full.AddLine("lost"));
@@ -86,12 +71,12 @@ TEST(CResumeState, SeveralRunsKnowOfEachOtherAndTornLinesOfNothing)
     EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "old digits", "1.5", "old"));
     EXPECT_TRUE(other.AddSynced());
     EXPECT_TRUE(other.AddMade("made.Kinetra", "key", "digits", "2.5", "new"));
-    WriteText(folder.Path(".gaitwright.resume.torn.jsonl"),
-              "{\"output\":\"torn.Kin\n[[[[\n\n17\n{\"output\":5,\"key\":\"key\"}\n");
-    WriteText(folder.Path(".gaitwright.resume.old.jsonl"),
-              "{\"output\":\"begun.Kinetra\"}\n{\"output\":\"old.Kinetra\"}\n{\"output\":\"old.Kinetra\","
-              "\"key\":\"key\",\"digits\":\"digits\",\"told\":\"told\"}\n");
-    WriteText(folder.Path("other.jsonl"), "{\"output\":\"strange.Kinetra\"}\n");
+    WriteBytes(folder.Path(".gaitwright.resume.torn.jsonl"),
+               "{\"output\":\"torn.Kin\n[[[[\n\n17\n{\"output\":5,\"key\":\"key\"}\n");
+    WriteBytes(folder.Path(".gaitwright.resume.old.jsonl"),
+               "{\"output\":\"begun.Kinetra\"}\n{\"output\":\"old.Kinetra\"}\n{\"output\":\"old.Kinetra\","
+               "\"key\":\"key\",\"digits\":\"digits\",\"told\":\"told\"}\n");
+    WriteBytes(folder.Path("other.jsonl"), "{\"output\":\"strange.Kinetra\"}\n");
 
     CResumeState next;
     next.Read(folder.Path());

@@ -31,8 +31,6 @@ void CScriptedWindow::SetChildText(std::string_view child, const std::string& te
 {
     if (child == "#title")
         m_kTitles.push_back(text);
-    else if (child == "#frame")
-        m_kPlace = text;
 }
 
 std::string CScriptedWindow::TakeWords()
@@ -160,13 +158,10 @@ std::string TargetText()
 std::string BvhText(const SourceBones& bones, int frameCount)
 {
     const Vec3 toe{0.0f, -4.0f, 12.0f};
-    const std::vector<TextJoint> joints{{bones.hip, -1, kVec3Zero},
-                                        {bones.leftThigh, 0, {9, -4, 0}},
-                                        {bones.leftCalf, 1, {0, -40, 0}},
-                                        {bones.leftFoot, 2, {0, -38, 0}, toe},
-                                        {bones.rightThigh, 0, {-9, -4, 0}},
-                                        {bones.rightCalf, 4, {0, -40, 0}},
-                                        {bones.rightFoot, 5, {0, -38, 0}, toe}};
+    const std::vector<TextJoint> joints{{bones[0], -1, kVec3Zero},      {bones[1], 0, {9, -4, 0}},
+                                        {bones[2], 1, {0, -40, 0}},     {bones[3], 2, {0, -38, 0}, toe},
+                                        {bones[4], 0, {-9, -4, 0}},     {bones[5], 4, {0, -40, 0}},
+                                        {bones[6], 5, {0, -38, 0}, toe}};
     return MadeText(joints, frameCount, 0.033334, [](size_t joint, int frame) {
         const auto n = static_cast<float>(5 * frame);
         return joint == 0 ? TextKey{{0, 80, n}, {0, n, 0}}
@@ -176,14 +171,10 @@ std::string BvhText(const SourceBones& bones, int frameCount)
 
 std::string BoneMapText(const std::string& name, const SourceBones& bones)
 {
-    const std::string rows[][2] = {
-        {bones.hip, "LowerTorso"},  {bones.leftThigh, "LThigh"},  {bones.leftCalf, "LCalf"},
-        {bones.leftFoot, "LFoot"},  {bones.rightThigh, "RThigh"}, {bones.rightCalf, "RCalf"},
-        {bones.rightFoot, "RFoot"},
-    };
+    const char* const targets[] = {"LowerTorso", "LThigh", "LCalf", "LFoot", "RThigh", "RCalf", "RFoot"};
     std::string text = name + "\nFrameRate 30\nPosition 0 0 0\n";
-    for (const auto& [source, target] : rows)
-        text.append(source).append(" <---> ").append(target).append(" 0,0,0,1,2,3\n");
+    for (size_t i = 0; i < bones.size(); ++i)
+        text.append(bones[i]).append(" <---> ").append(targets[i]).append(" 0,0,0,1,2,3\n");
     return text;
 }
 

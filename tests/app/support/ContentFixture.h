@@ -7,6 +7,7 @@
 #include "CPlatform.h"
 #include "TempFolder.h"
 
+#include <array>
 #include <functional>
 #include <gtest/gtest.h>
 #include <map>
@@ -85,7 +86,6 @@ public:
     std::map<std::string, bool> m_kEnabled;
     std::vector<Notice> m_kNotices; ///< also among the calls, as "notice CODE NAME"
     std::vector<std::string> m_kTitles;
-    std::string m_kPlace;              ///< frame and seconds next to the bar
     std::vector<std::string> m_kBoxes; ///< texts of the message boxes
     std::vector<std::string> m_kCalls;
     CWatchedView* m_pkSource = nullptr;
@@ -122,11 +122,8 @@ private:
 /// Returns the words of a text as a set.
 std::set<std::string> Words(std::string_view text);
 
-/// The bones of a source skeleton, from hip to feet.
-struct SourceBones
-{
-    std::string hip, leftThigh, leftCalf, leftFoot, rightThigh, rightCalf, rightFoot;
-};
+/// The bones of a source skeleton: the hip, then each leg from thigh to foot, left before right.
+using SourceBones = std::array<std::string, 7>;
 extern const SourceBones kPoserBones;
 extern const SourceBones kMaxBones;
 
