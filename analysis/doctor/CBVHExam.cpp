@@ -44,12 +44,18 @@ void CBVHExam::ReadRows(CLineCursor& lines)
 bool CBVHExam::WriteMended(const std::string& path)
 {
     CSafeFile file;
+    return file.Open(path) && WriteMended([&](std::string_view text) { return file.Write(text); }) &&
+           file.Commit();
+}
+
+bool CBVHExam::WriteMended(const CTextSink& write)
+{
     const size_t rowsBegin = m_bRows ? m_kOutline.rowsBegin : m_kText.size();
-    if (!file.Open(path) || !m_kEdits.Write(m_kText.substr(0, rowsBegin), file))
+    if (!m_kEdits.Write(m_kText.substr(0, rowsBegin), write))
         return false;
-    if (m_bRows && !CRowMender(m_kOutline, m_kPlan, m_kCells).Write(m_kText, file))
+    if (m_bRows && !CRowMender(m_kOutline, m_kPlan, m_kCells).Write(m_kText, write))
         return false;
-    return m_kFile.IsWhole() && file.Commit();
+    return m_kFile.IsWhole();
 }
 
 } // namespace gw

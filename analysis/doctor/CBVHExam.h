@@ -1,6 +1,7 @@
 #pragma once
 
 #include "BVHOutline.h"
+#include "CByteSink.h"
 #include "CFailureRecord.h"
 #include "CFindings.h"
 #include "CMappedFile.h"
@@ -34,6 +35,8 @@ public:
     /// Writes the text with all repairable faults fixed. If the file cannot be written, returns false and
     /// keeps the old one.
     bool WriteMended(const std::string& path);
+    /// Same for text that goes elsewhere, in pieces.
+    bool WriteMended(const CTextSink& write);
 
 private:
     void ReadRows(CLineCursor& lines);

@@ -40,6 +40,12 @@ bool CFileExam::WriteMended(const std::string& path)
     return text && text->WriteMended(path);
 }
 
+bool CFileExam::WriteMended(const CTextSink& write)
+{
+    const std::unique_ptr<CBVHExam> text = std::move(m_spText);
+    return text && text->WriteMended(write);
+}
+
 void CFileExam::TakeRecord(const std::string& path, const CFailureRecord& record)
 {
     if (record.Failure() && IsPointer(path))

@@ -31,6 +31,8 @@ public:
     /// Writes a BVH file with all repairable faults fixed. Works only once, because the text is released
     /// afterwards. Returns false if it cannot be written.
     bool WriteMended(const std::string& path);
+    /// Same for text that goes elsewhere, in pieces.
+    bool WriteMended(const CTextSink& write);
 
 private:
     CFindings m_kFindings;

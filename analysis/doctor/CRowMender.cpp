@@ -8,7 +8,6 @@
 
 #include "BVHOutline.h"
 #include "CLineCursor.h"
-#include "CSafeFile.h"
 #include "NumberText.h"
 #include "Numbers.h"
 #include "Text.h"
@@ -23,7 +22,7 @@ constexpr size_t kWriteBytes = size_t{1} << 20;
 
 } // namespace
 
-bool CRowMender::Write(std::string_view text, CSafeFile& file)
+bool CRowMender::Write(std::string_view text, const CTextSink& write)
 {
     CLineCursor lines(text, outline_.rowsBegin, outline_.rowsLine);
     const size_t rows = plan_.rowCount + plan_.dropsLast;
@@ -36,11 +35,11 @@ bool CRowMender::Write(std::string_view text, CSafeFile& file)
         m_kOut += text.substr(end, lines.NextOffset() - end);
         if (m_kOut.size() < kWriteBytes)
             continue;
-        if (!file.Write(m_kOut))
+        if (!write(m_kOut))
             return false;
         m_kOut.clear();
     }
-    return file.Write(m_kOut) && file.Write(text.substr(lines.NextOffset()));
+    return write(m_kOut) && write(text.substr(lines.NextOffset()));
 }
 
 void CRowMender::AppendRow(std::string_view row)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "CByteSink.h"
 #include "CRowCheck.h"
 #include "CRowTable.h"
 
@@ -12,7 +13,6 @@
 namespace gw {
 
 class CLineCursor;
-class CSafeFile;
 struct BVHOutline;
 
 /// Writes the rows of a motion according to a repair plan. Unchanged values keep their spelling, and so do
@@ -25,8 +25,8 @@ public:
     {
     }
 
-    /// Writes from the first row to the end of the text. Returns false if the file cannot be written.
-    bool Write(std::string_view text, CSafeFile& file);
+    /// Writes from the first row to the end of the text. Returns false if `write` did.
+    bool Write(std::string_view text, const CTextSink& write);
 
 private:
     void AppendRow(std::string_view row);

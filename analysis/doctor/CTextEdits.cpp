@@ -1,7 +1,5 @@
 #include "CTextEdits.h"
 
-#include "CSafeFile.h"
-
 #include <algorithm>
 
 namespace gw {
@@ -22,7 +20,7 @@ void CTextEdits::Add(size_t begin, size_t length, std::string_view instead)
     m_kInstead += instead;
 }
 
-bool CTextEdits::Write(std::string_view text, CSafeFile& file)
+bool CTextEdits::Write(std::string_view text, const CTextSink& write)
 {
     std::ranges::stable_sort(m_kEdits, {}, &Edit::begin);
     const std::string_view insteads = m_kInstead;
@@ -35,7 +33,7 @@ bool CTextEdits::Write(std::string_view text, CSafeFile& file)
         at = edit.begin + edit.length;
     }
     written += text.substr(at);
-    return file.Write(written);
+    return write(written);
 }
 
 } // namespace gw

@@ -1,13 +1,13 @@
 #pragma once
 
+#include "CByteSink.h"
+
 #include <cstddef>
 #include <string>
 #include <string_view>
 #include <vector>
 
 namespace gw {
-
-class CSafeFile;
 
 /// Replacements in a text, which itself is not changed. They can be added in any order but must not overlap;
 /// of two at one place, the first one is applied first. Edits beyond kMost are ignored: such a text is not a
@@ -20,8 +20,8 @@ public:
     /// Replaces `length` bytes starting at `begin` by `instead`.
     void Replace(size_t begin, size_t length, std::string_view instead);
 
-    /// Writes the text with all edits applied. Returns false if the file cannot be written.
-    bool Write(std::string_view text, CSafeFile& file);
+    /// Writes the text with all edits applied. Returns what `write` returns.
+    bool Write(std::string_view text, const CTextSink& write);
 
 private:
     struct Edit

@@ -107,6 +107,8 @@ void CConversionSection::AppendHead(CMarkup& page) const
     page.FileName(motion_.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(motion_.profile);
     page.Raw(" · ").Integer(sums.frameCount).Raw(" frames compared · ");
     page.Number(sums.frameCount * motion_.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
+    if (!motion_.advice.empty())
+        page.Raw("<p class=\"about\">").Raw(motion_.advice).Raw("</p>\n");
 }
 
 void CConversionSection::AppendTiles(CMarkup& page) const

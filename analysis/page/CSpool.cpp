@@ -1,8 +1,10 @@
 #include "CSpool.h"
 
 #include "CSafeFile.h"
+#include "SystemError.h"
 
 #include <array>
+#include <cerrno>
 #include <cstdlib>
 #include <filesystem>
 #include <string>
@@ -22,7 +24,10 @@ std::FILE* OpenNameless()
     std::string path = (std::filesystem::temp_directory_path(error) / "gaitwright-XXXXXX").string();
     const int file = error ? -1 : mkostemp(path.data(), O_CLOEXEC);
     if (file < 0)
+    {
+        KeepSystemError(error ? error.value() : errno);
         return nullptr;
+    }
     unlink(path.c_str());
     std::FILE* const stream = fdopen(file, "w+");
     if (!stream)
@@ -32,7 +37,7 @@ std::FILE* OpenNameless()
 
 } // namespace
 
-CSpool::CSpool() : m_pkFile(OpenNameless()) {}
+CSpool::CSpool() : m_pkFile(OpenNameless()), m_iError(TakeSystemError()) {}
 
 CSpool::~CSpool()
 {
@@ -42,14 +47,20 @@ CSpool::~CSpool()
 
 void CSpool::Write(std::string_view text)
 {
-    if (m_pkFile)
-        std::fwrite(text.data(), 1, text.size(), m_pkFile); // a failure is kept in the stream's error flag
+    // A failure is kept in the stream's error flag.
+    if (m_pkFile && std::fwrite(text.data(), 1, text.size(), m_pkFile) != text.size())
+        m_iError = errno;
 }
 
 bool CSpool::CopyTo(CSafeFile& file)
 {
-    if (!m_pkFile || std::fflush(m_pkFile) != 0 || std::ferror(m_pkFile))
+    if (m_pkFile && m_iError == 0 && std::fflush(m_pkFile) != 0)
+        m_iError = errno;
+    if (!m_pkFile || m_iError != 0 || std::ferror(m_pkFile))
+    {
+        KeepSystemError(m_iError);
         return false;
+    }
     std::rewind(m_pkFile); // clears the flag
     std::array<char, size_t{1} << 16> buffer;
     while (const size_t count = std::fread(buffer.data(), 1, buffer.size(), m_pkFile))

@@ -24,6 +24,7 @@ public:
 
 private:
     std::FILE* m_pkFile; // null if the file could not be created
+    int m_iError;        // why not; or why something could not be written
 };
 
 } // namespace gw

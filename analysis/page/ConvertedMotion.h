@@ -26,6 +26,7 @@ struct ConvertedMotion
     const MeasuredConversion* measured = nullptr;
     /// the same motion converted by default; null if this one was
     const MeasuredConversion* plain = nullptr;
+    std::string advice; ///< a sentence about options that give a better result; may be empty
 };
 
 } // namespace gw

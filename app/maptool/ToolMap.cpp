@@ -2,6 +2,7 @@
 
 #include "CGaitToolDialog.h"
 
+#include "SystemError.h"
 #include "ToolStatus.h"
 
 namespace gw {
@@ -112,7 +113,8 @@ void CGaitToolDialog::AskMapPath()
 bool CGaitToolDialog::SaveMap(const std::string& path)
 {
     const bool written = WriteMapLines(path, m_kMap.Lines());
-    m_kStatus = written ? SavedWords(path) : NotSavedWords(path, {EFailure::WriteError, 0, {}});
+    const Finding failure{.reason = EFailure::WriteError, .systemError = written ? 0 : TakeSystemError()};
+    m_kStatus = written ? SavedWords(path) : NotSavedWords(path, failure);
     return written;
 }
 

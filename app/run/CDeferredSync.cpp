@@ -1,4 +1,5 @@
 #include "CDeferredSync.h"
+#include "SystemError.h"
 
 #include <fcntl.h>
 #include <sys/stat.h>
@@ -40,8 +41,10 @@ std::string CDeferredSync::Sync() const
     std::string failed;
     for (const auto& [device, system] : m_kOpen)
     {
-        if (!SyncOne(system.file))
-            failed = system.path;
+        if (SyncOne(system.file))
+            continue;
+        KeepSystemError();
+        failed = system.path;
     }
     return failed;
 }

@@ -52,18 +52,18 @@ std::string Bar(size_t done, size_t total)
     return '[' + bar + ']';
 }
 
-size_t TerminalWidth()
-{
-    winsize size = {};
-    return ioctl(STDERR_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : kUsualWidth;
-}
-
 void Write(const std::string& text)
 {
     std::fwrite(text.data(), 1, text.size(), stderr);
 }
 
 } // namespace
+
+size_t TerminalWidth()
+{
+    winsize size = {};
+    return ioctl(STDERR_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : kUsualWidth;
+}
 
 std::string ProgressLine(const RunProgress& progress, size_t width)
 {

@@ -1,6 +1,7 @@
 #include "CReportFile.h"
 
 #include "CMappedFile.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <cerrno>
@@ -37,6 +38,8 @@ bool CReportFile::Open(const std::string& path, EStart start)
     const int cut = start == EStart::Empty ? O_TRUNC : 0;
     m_iFile = open(path.c_str(), O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC | cut, 0666);
     m_bFailed = m_iFile < 0;
+    if (m_bFailed)
+        KeepSystemError();
     return !m_bFailed && (!HasOpenLine() || AddLine({}));
 }
 
@@ -56,7 +59,10 @@ bool CReportFile::AddLine(std::string_view line)
         if (count > 0)
             rest.remove_prefix(static_cast<size_t>(count));
         else if (errno != EINTR)
+        {
+            KeepSystemError();
             m_bFailed = true;
+        }
     }
     return !m_bFailed;
 }

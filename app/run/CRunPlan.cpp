@@ -7,6 +7,7 @@
 #include "CMappedFile.h"
 #include "CSafeFile.h"
 #include "JsonText.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -106,7 +107,7 @@ Finding ReadPlan(const std::string& path, CRunPlan& plan)
 {
     CMappedFile file;
     if (const EFailure failure = file.Open(path); failure != EFailure::None)
-        return {failure};
+        return {.reason = failure, .systemError = TakeSystemError()};
     std::string_view rest = file.Text();
     size_t line = 0;
     for (std::string_view text; NextLine(rest, text);)

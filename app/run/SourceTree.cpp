@@ -54,6 +54,8 @@ public:
     SourceFolder tree;
 
 private:
+    void TakeEntry(const fs::directory_entry& entry);
+    void TakeFile(const fs::directory_entry& entry, const std::string& name);
     bool MayEnter(const fs::directory_entry& entry);
     bool LeadsBack(const fs::path& link) const;
 
@@ -61,32 +63,69 @@ private:
     fs::path m_kRealRoot;
     std::span<const std::string_view> m_kExtensions;
     std::set<Identity> m_kSeen;
+    // of the folder that is being read
+    std::vector<std::string> m_kFolders;
+    std::vector<std::vector<std::string>> m_kFiles; // by extension
+    std::vector<std::string> m_kDead;
 };
 
 void CWalk::Take(const std::string& below)
 {
-    std::vector<std::string> folders;
+    m_kFolders.clear();
+    m_kFiles.assign(m_kExtensions.size(), {});
+    m_kDead.clear();
     std::error_code error;
     fs::directory_iterator entry(m_kFolder + below, error);
     for (; !error && entry != fs::directory_iterator(); entry.increment(error))
-    {
-        if (MayEnter(*entry))
-            folders.push_back(entry->path().filename().string());
-    }
+        TakeEntry(*entry);
     if (error)
         tree.unreadable.push_back(m_kFolder + below);
-    for (const std::string_view extension : m_kExtensions)
-    {
-        for (const std::string& name : FilesInFolder(m_kFolder + below, extension))
-            tree.files.push_back(below + name);
-    }
+    const auto add = [&](std::vector<std::string>& names, std::vector<std::string>& list) {
+        std::ranges::sort(names);
+        for (const std::string& name : names)
+            list.push_back(below + name);
+    };
+    for (std::vector<std::string>& names : m_kFiles)
+        add(names, tree.files);
+    add(m_kDead, tree.deadLinks);
+    std::vector<std::string> folders = std::move(m_kFolders);
     std::ranges::sort(folders);
     for (const std::string& name : folders)
     {
         Identity identity;
-        if (Identify(m_kFolder + below + name, identity) && m_kSeen.insert(identity).second)
-            Take(std::string(below).append(name) + kPathSeparator);
+        std::string folder = below;
+        folder.append(name).push_back(kPathSeparator);
+        if (Identify(m_kFolder + folder, identity) && m_kSeen.insert(identity).second)
+            Take(folder);
     }
+}
+
+void CWalk::TakeEntry(const fs::directory_entry& entry)
+{
+    std::error_code error;
+    const std::string name = entry.path().filename().string();
+    if (name.starts_with('.'))
+        return;
+    if (entry.is_directory(error))
+    {
+        if (MayEnter(entry))
+            m_kFolders.push_back(name);
+        return;
+    }
+    TakeFile(entry, name);
+}
+
+// Most file systems list the type of each entry, so only links and sources cost a look.
+void CWalk::TakeFile(const fs::directory_entry& entry, const std::string& name)
+{
+    std::error_code error;
+    const auto found = std::ranges::find_if(
+        m_kExtensions, [&](std::string_view extension) { return HasExtension(name, extension); });
+    const bool isSource = found != m_kExtensions.end();
+    if (isSource && entry.is_regular_file(error))
+        m_kFiles[static_cast<size_t>(found - m_kExtensions.begin())].push_back(name);
+    else if ((isSource || name.find('.') == name.npos) && entry.is_symlink(error) && !entry.exists(error))
+        m_kDead.push_back(name);
 }
 
 // A link into the tree leads to a folder that is visited anyway, and one to a parent would add files that
@@ -94,7 +133,7 @@ void CWalk::Take(const std::string& below)
 bool CWalk::MayEnter(const fs::directory_entry& entry)
 {
     std::error_code error;
-    return entry.is_directory(error) && !(entry.is_symlink(error) && LeadsBack(entry.path()));
+    return !(entry.is_symlink(error) && LeadsBack(entry.path()));
 }
 
 bool CWalk::LeadsBack(const fs::path& link) const

@@ -12,6 +12,7 @@
 #include "ProfileFile.h"
 #include "ResultFile.h"
 #include "StringTable.h"
+#include "SystemError.h"
 #include "TKBVHStream.h"
 
 #include <algorithm>
@@ -41,12 +42,13 @@ void CFileConversion::TellMessage(int id) const
     Notify(MakeNotice({}, kFixedMessage, Message(id)));
 }
 
-bool CFileConversion::LoadSource(const std::string& path)
+bool CFileConversion::LoadSource(const std::string& path, const std::string& copy)
 {
     sourcePath_ = path;
     sourceNames_.reset();
     isScene_ = HasExtension(path, kSceneExtension);
-    const bool loaded = isScene_ ? LoadSourceScene(path, scene_, sourceRecord_) : motion_.Load(path);
+    const bool loaded =
+        isScene_ ? LoadSourceScene(path, scene_, sourceRecord_) : motion_.Load(copy.empty() ? path : copy);
     if (!isScene_)
         sourceRecord_ = motion_.Record();
     else if (loaded)
@@ -94,7 +96,7 @@ bool CFileConversion::UseProfile(const std::string& path)
     if (isRead)
         UseProfile(path, profile);
     else
-        Notify(MakeNotice(path, {EFailure::BadProfile}));
+        Notify(MakeNotice(path, {.reason = EFailure::BadProfile, .systemError = TakeSystemError()}));
     return isRead;
 }
 

@@ -25,7 +25,8 @@ public:
     /// An empty data folder means the program's own folder.
     CFileConversion(const std::string& dataFolder, const ConversionChoices& choices, NoticeListener listener);
 
-    bool LoadSource(const std::string& path);
+    /// Reads a source. `copy`, unless empty, is the file to read in its place.
+    bool LoadSource(const std::string& path, const std::string& copy = {});
     /// Reads the base skeleton. Each conversion needs a new one.
     bool LoadTarget();
     bool UseProfile(const std::string& path);

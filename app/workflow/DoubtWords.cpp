@@ -131,7 +131,7 @@ Notice DoubtfulNotice(const std::string& source, const ProfileChoice& choice)
     std::string words = "the best-matching profile, " + Quoted(choice.profile.name) + ", is doubtful";
     for (const std::string& doubt : DoubtWords(choice.verdict))
         words += "\n  " + doubt;
-    words += "\n  pass --profile to use it anyway, or draft one with 'gaitwright suggest'";
+    words += "\n  pass --profile to use it anyway";
     return MakeNotice(source, "doubtful", words);
 }
 

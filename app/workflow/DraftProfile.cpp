@@ -14,6 +14,7 @@
 #include "SourceTiming.h"
 #include "StringTable.h"
 #include "SuggestProfile.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <filesystem>
@@ -76,7 +77,7 @@ int CGaitConvertContent::DraftProfile()
         !file.Write(ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())) ||
         !file.Commit())
     {
-        window_.Notify(MakeNotice(path, {EFailure::WriteError}));
+        window_.Notify(MakeNotice(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()}));
         window_.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
         return 0;
     }

@@ -1,6 +1,7 @@
 #include "FindingWords.h"
 
 #include "MotionFacts.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <cstddef>
@@ -209,6 +210,7 @@ std::string FindingWords(const std::string& path, const Finding& finding)
     std::string words(SentenceOf(finding.reason).words);
     if (!finding.name.empty() && finding.name != path)
         words += ": \"" + Printable(finding.name) + '"';
+    words += SystemErrorWords(finding.systemError);
     if (finding.more > 0)
         words += ", and " + std::to_string(finding.more) + " more";
     return words;
@@ -217,9 +219,10 @@ std::string FindingWords(const std::string& path, const Finding& finding)
 Notice MakeNotice(const std::string& path, const Finding& finding)
 {
     const Sentence& sentence = SentenceOf(finding.reason);
-    return {finding.severity, path,
-            finding.where,    std::string(sentence.code),
-            finding.name,     FindingWords(path, finding) + InBrackets(sentence.remedy)};
+    // The system's reason says more than advice that fits every reason.
+    const std::string_view remedy = finding.systemError == 0 ? sentence.remedy : std::string_view();
+    return {finding.severity,           path,         finding.where,
+            std::string(sentence.code), finding.name, FindingWords(path, finding) + InBrackets(remedy)};
 }
 
 std::string FindingLine(const std::string& path, const Finding& finding)

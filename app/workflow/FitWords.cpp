@@ -5,6 +5,10 @@
 #include "ProfileFit.h"
 #include "Text.h"
 
+#include <algorithm>
+#include <span>
+#include <vector>
+
 namespace gw {
 
 namespace {
@@ -15,6 +19,29 @@ std::string MissingLine(const MissingBone& missing)
     const std::string nearest =
         missing.nearest.empty() ? "; no similar name found" : "; the closest is " + Quoted(missing.nearest);
     return "  " + place + "the " + SideName(missing.side) + " has no bone " + Quoted(missing.name) + nearest;
+}
+
+std::string Lines(std::span<const MissingBone> bones)
+{
+    std::string lines;
+    for (const MissingBone& missing : bones)
+    {
+        lines += lines.empty() ? "" : "\n";
+        lines += MissingLine(missing);
+    }
+    return lines;
+}
+
+// Returns the three rows that are closest to matching, and the number of the others.
+std::string NearestLines(const CProfileFit& fit)
+{
+    constexpr size_t kNamed = 3;
+    std::vector<MissingBone> bones = fit.missing;
+    std::stable_partition(bones.begin(), bones.end(),
+                          [](const MissingBone& bone) { return !bone.nearest.empty(); });
+    const size_t named = std::min(bones.size(), kNamed);
+    const std::string lines = Lines(std::span(bones).first(named));
+    return bones.size() == named ? lines : lines + "\n  " + std::to_string(bones.size() - named) + " more";
 }
 
 } // namespace
@@ -33,21 +60,16 @@ std::string FitSummary(const CProfileFit& fit)
 
 std::string MissingLines(const CProfileFit& fit)
 {
-    std::string lines;
-    for (const MissingBone& missing : fit.missing)
-    {
-        lines += lines.empty() ? "" : "\n";
-        lines += MissingLine(missing);
-    }
     if (!fit.drivesRoot && fit.missing.empty())
-        lines = "  no row drives the target's root bone " + Quoted(kRootBone);
-    return lines;
+        return "  no row drives the target's root bone " + Quoted(kRootBone);
+    return Lines(fit.missing);
 }
 
 Notice MisfitNotice(const std::string& source, const CProfileFit& fit)
 {
     const std::string summary = "profile " + Quoted(fit.name) + ": " + FitSummary(fit);
-    return MakeNotice(source, "misfit", summary + '\n' + MissingLines(fit));
+    const std::string lines = fit.missing.empty() ? MissingLines(fit) : NearestLines(fit);
+    return MakeNotice(source, "misfit", summary + '\n' + lines);
 }
 
 } // namespace gw

@@ -25,8 +25,7 @@ bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
     if (profileRate <= 0)
         return record.Fail(EFailure::BadNumber, 0, "FrameRate " + std::to_string(profileRate));
     const bool saved = save(rate / static_cast<float>(profileRate));
-    const Finding& failure = result.Record().Failure();
-    return saved || record.Fail(failure.reason, failure.where, failure.name);
+    return saved || record.Fail(result.Record().Failure());
 }
 
 // The HTR text goes directly into the package, so an HTR file next to it is not touched.

@@ -4,7 +4,6 @@
 
 #include <cstddef>
 #include <string>
-#include <utility>
 #include <vector>
 
 namespace gw {
@@ -13,14 +12,11 @@ namespace gw {
 class CFailureRecord
 {
 public:
-    /// Records the first failure and ignores later ones. Always returns false, so that `return
-    /// record.Fail(...)` works.
-    bool Fail(EFailure reason, size_t where = 0, std::string name = {})
-    {
-        if (!m_kFailure)
-            m_kFailure = {reason, where, std::move(name)};
-        return false;
-    }
+    /// Records the first failure and ignores later ones. If a system call failed, records the system's reason
+    /// too. Always returns false, so that `return record.Fail(...)` works.
+    bool Fail(EFailure reason, size_t where = 0, std::string name = {});
+    /// Records a failure from another record.
+    bool Fail(const Finding& failure);
     /// Records a warning. Only the first kWarningsPerReason of each reason are kept.
     void Warn(EFailure reason, size_t where = 0, std::string name = {});
     void Clear() { *this = {}; }

@@ -1,5 +1,6 @@
 #include "CMappedFile.h"
 
+#include "SystemError.h"
 #include "WatchedRange.h"
 
 #include <algorithm>
@@ -51,11 +52,17 @@ CMappedFile& CMappedFile::operator=(CMappedFile&& other) noexcept
 EFailure CMappedFile::Open(const std::string& path)
 {
     Close();
+    ForgetSystemError();
     // Without O_NONBLOCK, opening a named pipe would wait for a writer before it can be refused.
     const int file = open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK);
     if (file < 0)
+    {
+        KeepSystemError();
         return EFailure::NotFound;
+    }
     const EFailure failure = Take(file);
+    if (IsOfSystem(failure))
+        KeepSystemError();
     if (m_iFile < 0)
         close(file);
     return failure;

@@ -3,6 +3,7 @@
 #include "LiveNames.h"
 #include "Paths.h"
 #include "PrivateNames.h"
+#include "SystemError.h"
 
 #include <cerrno>
 #include <utility>
@@ -13,13 +14,23 @@
 
 namespace gw {
 
+namespace {
+
+bool FailWrite()
+{
+    KeepSystemError();
+    return false;
+}
+
+} // namespace
+
 bool WriteAll(int file, std::string_view text)
 {
     while (!text.empty())
     {
         const ssize_t written = write(file, text.data(), text.size());
         if (written < 0 && errno != EINTR)
-            return false;
+            return FailWrite();
         text.remove_prefix(written < 0 ? 0 : static_cast<size_t>(written));
     }
     return true;
@@ -31,7 +42,7 @@ bool WriteAllAt(int file, std::string_view text, uint64_t offset)
     {
         const ssize_t written = pwrite(file, text.data(), text.size(), static_cast<off_t>(offset));
         if (written < 0 && errno != EINTR)
-            return false;
+            return FailWrite();
         const size_t count = written < 0 ? 0 : static_cast<size_t>(written);
         text.remove_prefix(count);
         offset += count;
@@ -61,6 +72,8 @@ bool CPrivateFile::Create(const std::string& folder, std::string_view extension,
         m_iLiveName = AddLiveName(m_kPath);
         m_iFile = open(m_kPath.c_str(), O_RDWR | O_CREAT | O_EXCL | O_CLOEXEC, mode);
         const bool isTaken = m_iFile < 0 && errno == EEXIST;
+        if (m_iFile < 0)
+            KeepSystemError();
         if (m_iFile >= 0 && LockNewFile(m_iFile))
             return true;
         const bool isSwept = m_iFile >= 0;

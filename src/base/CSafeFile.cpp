@@ -10,6 +10,7 @@
 #include "CSafeFile.h"
 
 #include "Paths.h"
+#include "SystemError.h"
 
 #include <cerrno>
 #include <cstdio>
@@ -115,6 +116,7 @@ CSafeFile::~CSafeFile()
 bool CSafeFile::Open(const std::string& path)
 {
     Discard();
+    ForgetSystemError();
     m_eFailure = EFailure::WriteError;
     m_bKeeps = KeptPaths().erase(path) > 0;
     if (m_bKeeps && IsThere(path))
@@ -139,10 +141,19 @@ bool CSafeFile::MayReplace()
 {
     struct stat status;
     if (stat(m_kPath.c_str(), &status) != 0)
-        return errno == ENOENT;
+    {
+        const bool isFree = errno == ENOENT;
+        if (!isFree)
+            KeepSystemError();
+        return isFree;
+    }
     m_uiMode = status.st_mode & kPermissions;
     m_uiGroup = status.st_gid;
-    return S_ISREG(status.st_mode) && !IsReadOnly(m_kPath);
+    if (!S_ISREG(status.st_mode) || !IsReadOnly(m_kPath))
+        return S_ISREG(status.st_mode);
+    // root may write to a file without write bits, but then nobody is meant to
+    KeepSystemError(access(m_kPath.c_str(), W_OK) == 0 ? EACCES : errno);
+    return false;
 }
 
 bool CSafeFile::Write(std::string_view text)
@@ -167,7 +178,11 @@ bool CSafeFile::Commit()
 {
     if (m_kPrivate.File() < 0)
         return false;
-    const bool good = !m_bFailed && KeepOwnership() && Sync() && Rename();
+    errno = 0; // a gate that stays closed is no failure of the system
+    const bool isWritten = !m_bFailed;
+    const bool good = isWritten && KeepOwnership() && Sync() && Rename();
+    if (isWritten && !good)
+        KeepSystemError();
     if (good)
         m_kPrivate.Release();
     else if (m_eFailure == EFailure::None)

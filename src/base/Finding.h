@@ -110,9 +110,16 @@ struct Finding
     ESeverity severity = ESeverity::Error;
     bool mendable = false; ///< can be fixed in a repaired copy
     size_t more = 0;       ///< further findings like this one, which are only counted
+    int systemError = 0;   ///< errno of the system call that failed; 0 if there is none
 
     explicit operator bool() const { return reason != EFailure::None; }
 };
+
+/// Returns whether a failed system call may be the cause of a failure.
+constexpr bool IsOfSystem(EFailure reason)
+{
+    return reason == EFailure::NotFound || reason == EFailure::ReadError || reason == EFailure::WriteError;
+}
 
 /// Returns whether a reason is used by readers and writers, not by an examination or a conversion.
 constexpr bool IsOfReader(EFailure reason)

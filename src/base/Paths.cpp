@@ -4,6 +4,7 @@
 #include "Paths.h"
 
 #include "PrivateNames.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -118,6 +119,8 @@ bool CreateFolder(const std::string& path)
 {
     std::error_code error;
     fs::create_directories(NativePath(path), error);
+    if (error)
+        KeepSystemError(error.value());
     return FolderExists(path);
 }
 

@@ -61,8 +61,8 @@ class Check(ReportTest):
     def test_the_figures_stand_under_each_result(self):
         for name in ("a", "b"):
             self.write("takes/%s.bvh" % name, WALK.read_bytes())
-        plain = self.succeed("convert", "takes", "--out-dir", "plain").out
-        told = self.succeed("convert", "takes", "--out-dir", "out", "--check").out
+        plain = self.succeed("convert", "takes", "--out-dir", "plain", "--verbose").out
+        told = self.succeed("convert", "takes", "--out-dir", "out", "--check", "--verbose").out
         kept = [line for line in told.splitlines() if not line.startswith("  ")]
         self.assertEqual([line.replace("out/", "plain/") for line in kept], plain.splitlines())
         for word in ("parts: upper arm ", "contacts F1 ", "worst: frame "):

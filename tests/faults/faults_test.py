@@ -27,6 +27,7 @@ if Path("/dev/shm").is_dir():
 SHIM = os.environ["GAITWRIGHT_FAULT_SHIM"]
 SANITIZED = os.environ["GAITWRIGHT_SANITIZED"] == "1"
 OPERATIONS = ["open", "read", "write", "rename", "sync", "close", "map", "mode", "reserve"]
+REASONS = {"write": "No space left on device", "rename": "Input/output error", "sync": "Input/output error"}
 SAMPLES = int(os.environ.get("FAULT_SAMPLES", 40))  # of the allocations of one run
 OLD = b"what was there\n"
 DATA = Path(tempfile.mkdtemp(prefix="gaitwright-data-"))  # with a few profiles in place of all
@@ -186,6 +187,8 @@ class Faults(CliTest):
                         code, words, _ = self.start(case, operation, number)
                         self.assert_whole(case, good, code, words)
                         failed += code == FAILED
+                        if code == FAILED and operation in REASONS and case.command[0] == PROGRAM:
+                            self.assertIn(REASONS[operation], words, "the system's own reason")
                 print("%s: %s: %d calls, %d tried, %d told" % (case.what, operation, calls,
                                                                len(range(1, calls + 1, step)), failed), flush=True)
                 if operation in ("write", "rename", "sync"):

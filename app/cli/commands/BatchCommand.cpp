@@ -1,9 +1,11 @@
 // `batch`: the desktop program's folder run, with the same profile rules and messages.
 
 #include "CBatchRun.h"
+#include "CDraftShelf.h"
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
 #include "CShellNotices.h"
+#include "CheckResult.h"
 #include "CommandTable.h"
 #include "NoticeJson.h"
 #include "Output.h"
@@ -15,6 +17,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <optional>
 
 namespace gw {
 
@@ -53,7 +56,10 @@ size_t FinishedCount(const ShellOptions& options, const CBatchRun& run, bool fai
 EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
 {
     CShellNotices ownNotices(options);
-    CShellConversion conversion(options, {}, ownNotices);
+    std::optional<CDraftShelf> drafts;
+    CShellConversion conversion(options, ChoicesOf(options), ownNotices);
+    if (options.draft) // one profile for all files, so one draft at most
+        conversion.UseDrafts(drafts.emplace(options.drafts, 1));
     CBatchRun run(options, jobs, StateOf(options), conversion, ownNotices);
     const bool begins = SelectProfile(options, conversion, jobs.front().source);
     const EExit exit = begins ? run.RunAll() : EExit::Failed;

@@ -15,6 +15,7 @@
 #include "PageOutput.h"
 #include "Paths.h"
 #include "ProfileFile.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -90,7 +91,7 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
     std::vector<MissingBone> missing;
     if (!ReadBonePairs(profilePath, source, result, pairs, missing))
     {
-        SayError(Printable(profilePath) + ": the profile cannot be read");
+        SayError(Printable(profilePath) + ": the profile cannot be read" + TakeSystemErrorWords());
         return false;
     }
     for (const MissingBone& bone : missing)

@@ -16,9 +16,10 @@ namespace {
 
 constexpr float kPackageSixty = 60.0f; // stored after the rate in every package
 
-EExit Fail(const std::string& path, EFailure reason)
+EExit Fail(const std::string& path, Finding failure)
 {
-    SayFailure(path, {reason, 0, {}});
+    failure.name.clear();
+    SayFailure(path, failure);
     return EExit::Failed;
 }
 
@@ -39,7 +40,7 @@ EExit RunResave(const ShellOptions& options)
         return EExit::Failed;
     SayWarnings(options, source, scene.Record());
     if (!scene.SaveFile(output))
-        return Fail(output, scene.Record().Failure().reason);
+        return Fail(output, scene.Record().Failure());
     return TellWritten(options, source, output);
 }
 
@@ -61,7 +62,10 @@ EExit RunExtract(const ShellOptions& options)
     if (!inside.empty() && !HasExtension(options.output, inside))
         SayWord(options, "warning: " + Printable(source) + " contains an " + inside + " file");
     if (!WriteWhole(options.output, blocks.file->Data()))
-        return Fail(options.output, EFailure::WriteError);
+    {
+        SayNotWritten(options.output);
+        return EExit::Failed;
+    }
     return TellWritten(options, source, options.output);
 }
 
@@ -74,7 +78,7 @@ EExit RunPackage(const ShellOptions& options)
     CFailureRecord record;
     PackageMotion(source, output, options.rate, kPackageSixty, record);
     if (const Finding& failure = record.Failure())
-        return Fail(failure.name.empty() ? output : failure.name, failure.reason);
+        return Fail(failure.name.empty() ? output : failure.name, failure);
     return TellWritten(options, source, output);
 }
 

@@ -2,6 +2,7 @@
 
 #include "CConversionPage.h"
 #include "CConversionRun.h"
+#include "CDraftShelf.h"
 #include "CPagePart.h"
 #include "CommandTable.h"
 #include "ConversionJobs.h"
@@ -58,7 +59,12 @@ EExit RunOne(const ShellOptions& options, const ConversionJob& job)
     std::optional<CPagePart> part;
     if (IsPageAsked(options))
         part.emplace(1, 1);
-    const EConversion outcome = ConvertFile(options, job, nullptr, part ? &*part : nullptr, EProcess::Ends);
+    std::optional<CDraftShelf> drafts;
+    if (options.draft)
+        drafts.emplace(options.dryRun ? std::string() : options.drafts, 1);
+    const EConversion outcome = ConvertFile(
+        options, job,
+        {.part = part ? &*part : nullptr, .drafts = drafts ? &*drafts : nullptr, .process = EProcess::Ends});
     bool isWritten = true;
     if (part && part->HasFigures())
     {

@@ -184,7 +184,7 @@ EExit FixFile(const ShellOptions& options)
     }
     if (!exam.WriteMended(options.fix))
     {
-        SayFailure(options.fix, {EFailure::WriteError, 0, {}});
+        SayNotWritten(options.fix);
         return EExit::Failed;
     }
     CFileExam copy;

@@ -6,6 +6,7 @@
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "TreeViewScript.h"
 #include "Words.h"
@@ -43,9 +44,9 @@ EExit RunDump(const ShellOptions& options)
         SayWord(options, "warning: " + Printable(source) + ": the file has no roots to show");
     const std::string folder = WithSeparator(options.outputFolder);
     if (!CreateFolder(options.outputFolder))
-        return Fail(folder, "the folder cannot be created");
+        return Fail(folder, "the folder cannot be created" + TakeSystemErrorWords());
     if (!WriteTreeView(folder))
-        return Fail(folder + "TreeView.js", "the file cannot be written");
+        return Fail(folder + "TreeView.js", "the file cannot be written" + TakeSystemErrorWords());
 
     // Thousands of pages are synced together; syncing them one by one would take half of the time.
     CDeferredSync sync;
@@ -60,7 +61,7 @@ EExit RunDump(const ShellOptions& options)
     if (dump.FailedCount() == 0)
         return EExit::Done;
     return Fail(folder, std::to_string(dump.FailedCount()) + " of " + std::to_string(dump.PageCount()) +
-                            " pages cannot be written");
+                            " pages cannot be written" + TakeSystemErrorWords());
 }
 
 } // namespace gw

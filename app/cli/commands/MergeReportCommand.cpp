@@ -2,13 +2,16 @@
 // of the reports does not matter, and a source reported twice counts with its last line.
 
 #include "CMappedFile.h"
+#include "CRunSummary.h"
 #include "CSafeFile.h"
 #include "CommandTable.h"
 #include "Notice.h"
 #include "NoticeJson.h"
+#include "OptionJson.h"
 #include "Output.h"
 #include "PlanFile.h"
 #include "RunTally.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -68,7 +71,7 @@ bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines
     {
         if (ReadReport(path, lines))
             continue;
-        SayError(Printable(path) + ": the report cannot be read");
+        SayError(Printable(path) + ": the report cannot be read" + TakeSystemErrorWords());
         return false;
     }
     for (size_t shard = 0; named.empty() && shard < plan.shardCount; ++shard)
@@ -76,7 +79,7 @@ bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines
     return true;
 }
 
-void SayFailures(const ShellOptions& options, const std::string& line)
+void SayNotices(const ShellOptions& options, const std::string& line)
 {
     std::vector<Notice> notices;
     ReadNotices(line, notices);
@@ -85,7 +88,8 @@ void SayFailures(const ShellOptions& options, const std::string& line)
 }
 
 // Sorts the lines in plan order and counts their results.
-std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines& lines, RunTally& tally)
+std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines& lines, RunTally& tally,
+                 CRunSummary& summary)
 {
     std::string joined;
     for (const CRunPlan::Entry& entry : plan.entries)
@@ -98,7 +102,9 @@ std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines&
         }
         ++tally[found->second.outcome];
         joined += found->second.text + '\n';
-        SayFailures(options, found->second.text);
+        summary.Take(entry.source, found->second.outcome, found->second.text);
+        if (options.verbose)
+            SayNotices(options, found->second.text);
     }
     return joined;
 }
@@ -126,7 +132,7 @@ bool Write(const ShellOptions& options, const std::string& joined)
     CSafeFile file;
     if (file.Open(options.output) && file.Write(joined) && file.Commit())
         return true;
-    SayError(Printable(options.output) + ": the report cannot be written");
+    SayError(Printable(options.output) + ": the report cannot be written" + TakeSystemErrorWords());
     return false;
 }
 
@@ -141,10 +147,14 @@ EExit RunMergeReport(const ShellOptions& options)
     if (!options.output.empty() && !MayWrite(options, options.output))
         return EExit::Failed;
     RunTally tally;
-    if (!Write(options, Join(options, plan, lines, tally)))
+    CRunSummary summary;
+    if (!Write(options, Join(options, plan, lines, tally, summary)))
         return EExit::Failed;
     SayLeft(plan, lines);
-    TellTally(options, tally);
+    std::string wrong;
+    ShellOptions planned = options; // the summary depends on the options of the run
+    ReadOptionsJson(plan.options, ~kHowToRun, planned, wrong);
+    summary.Tell(planned, tally, options.verbose);
     return tally[EConversion::Failed] + tally.left == 0 ? EExit::Done : EExit::Failed;
 }
 

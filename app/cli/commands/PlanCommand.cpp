@@ -11,6 +11,7 @@
 #include "Paths.h"
 #include "PlanFile.h"
 #include "RunSetup.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -110,7 +111,7 @@ EExit RunPlan(const ShellOptions& options)
         return EExit::Failed;
     if (!WritePlan(options.output, plan))
     {
-        SayError(Printable(options.output) + ": the plan cannot be written");
+        SayError(Printable(options.output) + ": the plan cannot be written" + TakeSystemErrorWords());
         return EExit::Failed;
     }
     TellPlan(options, plan);

@@ -3,6 +3,7 @@
 #include "Arguments.h"
 #include "CommandTable.h"
 #include "LiveNames.h"
+#include "SystemError.h"
 #include "Words.h"
 
 #include <cerrno>
@@ -54,9 +55,10 @@ int RunProgram(int argc, char** argv)
     std::signal(SIGXFSZ, SIG_IGN);
 #endif
     EExit exit = RunArguments(argc, argv);
+    errno = 0;
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {
-        SayError("standard output cannot be written");
+        SayError("standard output cannot be written" + SystemErrorWords(errno));
         exit = EExit::Failed;
     }
     return static_cast<int>(exit);

@@ -147,7 +147,7 @@ bool Draw(const PictureOptions& options, const std::string& output)
         return Refuse("the OpenGL driver cannot draw this picture without a display; Mesa's driver can");
     if (WritePng(output, picture))
         return true;
-    SayFailure(output, {EFailure::WriteError, 0, {}});
+    SayNotWritten(output);
     return false;
 }
 

@@ -7,11 +7,10 @@
 #include "CShellNotices.h"
 #include "CommandTable.h"
 #include "DoubtWords.h"
+#include "DraftedProfile.h"
 #include "Notice.h"
 #include "Output.h"
 #include "Paths.h"
-#include "ProfileFile.h"
-#include "SourceTiming.h"
 #include "SuggestProfile.h"
 #include "Text.h"
 #include "Words.h"
@@ -22,8 +21,6 @@ namespace gw {
 
 namespace {
 
-constexpr const char* kJointWords[] = {"hip",     "spine joint", "neck",  "head", "clavicle", "upper arm",
-                                       "forearm", "hand",        "thigh", "shin", "foot",     "toe"};
 constexpr const char* kSurenessWords[] = {"sure", "likely", "unsure"};
 
 constexpr const char* kEvidenceWords[] = {
@@ -41,15 +38,6 @@ template <class Enum, size_t count>
 const char* Text(const char* const (&words)[count], Enum value)
 {
     return words[static_cast<size_t>(value)];
-}
-
-// "left upper arm"
-std::string PlaceWords(BodyPlace place)
-{
-    const char* const joint = Text(kJointWords, place.joint);
-    if (!HasSides(place.joint))
-        return joint;
-    return std::string(place.side == EBodySide::Left ? "left " : "right ") + joint;
 }
 
 std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
@@ -146,10 +134,7 @@ void WriteJson(const ShellOptions& options, const std::string& name, const Sugge
 // Prints which of the thirteen required joints were not found.
 EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
 {
-    std::string words = Printable(source) + ": no complete body was found by names or shape; missing: ";
-    for (const BodyPlace& place : profile.missing)
-        words += (&place == profile.missing.data() ? "" : ", ") + PlaceWords(place);
-    SayError(words);
+    SayError(Printable(source) + ": " + WhyNotSure(profile));
     for (const SuggestedRow& row : profile.rows)
     {
         if (row.kind == ESuggestedRow::NoName)
@@ -165,30 +150,18 @@ bool WriteProfile(const std::string& path, const std::string& text)
     CSafeFile file;
     if (file.Open(path) && file.Write(text) && file.Commit())
         return true;
-    SayFailure(path, {EFailure::WriteError});
+    SayNotWritten(path);
     return false;
-}
-
-// Results are as long as the source only if the profile has the source's rate.
-void WarnOfRate(const ShellOptions& options, int sourceRate, int profileRate)
-{
-    if (sourceRate == profileRate)
-        return;
-    const std::string words = "the source has " + std::to_string(sourceRate) +
-                              " frames per second, but the nearest rate that a profile can have is " +
-                              std::to_string(profileRate) + ", so results will play " +
-                              (sourceRate < profileRate ? "faster" : "slower");
-    SayNotice(options, MakeNotice(options.output, "rate", words, ESeverity::Warning));
 }
 
 // Writes the profile and prints its rows.
 EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
 {
     const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
-    const int frameRate = ProfileRateOf(sourceRoot);
-    if (!WriteProfile(options.output, ProfileText(name, frameRate, kVec3Zero, profile.Table())))
+    if (!WriteProfile(options.output, DraftText(profile, SplitPath(options.files[0]).stem, sourceRoot)))
         return EExit::Failed;
-    WarnOfRate(options, SourceRateOf(sourceRoot), frameRate);
+    if (const std::optional<Notice> warning = RateWarning(options.output, sourceRoot))
+        SayNotice(options, *warning);
     if (!profile.turnsFromRest)
         SayWord(options,
                 std::string("the rest pose ") +

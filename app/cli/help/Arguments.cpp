@@ -222,6 +222,7 @@ std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
     if (options.files.size() > MostOperands(command))
         return RefuseFor(command, "unexpected argument: " + Quoted(options.files[MostOperands(command)]));
+    options.draft = options.draft || !options.drafts.empty();
     return std::nullopt;
 }
 

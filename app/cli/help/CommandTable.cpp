@@ -17,13 +17,15 @@ constexpr ShellCommand Row(std::string_view name, std::string_view operands, uin
 }
 
 // Options of runs over many files.
-constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit;
+constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit | kVerbose;
 
-constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kAlign | kFaithful |
-                                     kNoHands | kForce | kSkipExisting | kDryRun | kKeepGoing | kCheck |
-                                     kHtml | kManyOptions;
+// Options that get more files through, and more faithfully.
+constexpr uint64_t kHelpOptions = kAlign | kFaithful | kNoHands | kDraft | kDrafts | kMend | kCheck;
 
-constexpr uint64_t kBatchOptions = kJob | kProfile | kOutputFolder | kKeepGoing | kManyOptions;
+constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kHelpOptions | kForce |
+                                     kSkipExisting | kDryRun | kKeepGoing | kHtml | kManyOptions;
+
+constexpr uint64_t kBatchOptions = kJob | kProfile | kOutputFolder | kHelpOptions | kKeepGoing | kManyOptions;
 
 // Conversion options that are fixed when a run is planned; the rest are given when it runs.
 constexpr uint64_t kPlanOptions =
@@ -40,16 +42,21 @@ constexpr ShellCommand kCommands[] = {
         "and its confidence. A profile that confuses left and right, or arm and clavicle, is used only if\n"
         "you name it. If the names in the source share a prefix (Model_, mixamorig3:), it is added to those\n"
         "of the profile.\n"
+        "--draft makes a profile if no installed one fits, as 'gaitwright suggest' does. --mend reads a\n"
+        "damaged .bvh file repaired, as 'gaitwright doctor --fix' does. The result line says so.\n"
         "If OUT ends in .htr, only the motion file is written. Several sources, or a folder, need "
         "--out-dir;\n"
-        "results keep the folder structure of their sources. Many files are converted by several processes:\n"
-        "one that crashes or hangs loses only its own file. The first failure ends the run unless you pass\n"
-        "--keep-going. Results and messages are the same for any number of processes.\n"
+        "results keep the folder structure of their sources. A folder gives all motion files in it, except\n"
+        "hidden ones. Many files are converted by several processes: one that crashes or hangs loses only\n"
+        "its own file. The first failure ends the run unless you pass --keep-going. Results and messages "
+        "are\n"
+        "the same for any number of processes. The run ends with a summary; --verbose prints each result.\n"
         "--align first re-expresses the source relative to a T-pose, like 'gaitwright align'. Every mapped\n"
         "bone then points as in the source. Only the names in the profile are used, because its rotations\n"
         "and axes were made for the source's own rest pose.\n"
-        "--check measures each result and lists its worst frames. --html PAGE writes the same as a page for\n"
-        "a browser; with several sources, it begins with a table, worst result first.",
+        "--check measures each result and lists its worst frames; if it is far off, also what --align\n"
+        "--faithful would give. --html PAGE writes the same as a page for a browser; with several sources,\n"
+        "it begins with a table, worst result first.",
         "gaitwright convert walk.bvh -o walk.Kinetra --profile \"Poser BVH\""),
     Row("batch", "FOLDER", kBatchOptions, kJob, RunBatchFolder,
         "Convert every .bvh in a folder to an .htr next to it, or package every .htr.\n"
@@ -64,11 +71,11 @@ constexpr ShellCommand kCommands[] = {
         "source\n"
         "fails.",
         "gaitwright plan archive --shards 8 -o plan.jsonl --out-dir results"),
-    Row("run", "PLAN", kForce | kJobs | kReport | kTimeLimit | kShard, kShard, RunShard,
+    Row("run", "PLAN", kForce | kJobs | kReport | kTimeLimit | kVerbose | kShard, kShard, RunShard,
         "Convert one shard of a plan; run it again to finish what is left.\n"
         "By default, the report is written next to the plan: plan.shard-3.jsonl.",
         "gaitwright run plan.jsonl --shard 3"),
-    Row("merge-report", "PLAN [REPORT...]", kOutput | kForce, 0, RunMergeReport,
+    Row("merge-report", "PLAN [REPORT...]", kOutput | kForce | kVerbose, 0, RunMergeReport,
         "Merge the reports of all shards; print the summary and return the exit code of a single run.\n"
         "Lines are in the order of the plan. Without REPORT, the reports next to the plan are used. Without\n"
         "-o, the lines go to standard output. A source without a line is unfinished: run its shard again.",

@@ -45,14 +45,18 @@ enum EOption : uint64_t
     kShards = 1ull << 31,
     kShard = 1ull << 32,
     kNoHands = 1ull << 33,
+    kDraft = 1ull << 34,
+    kDrafts = 1ull << 35,
+    kMend = 1ull << 36,
+    kVerbose = 1ull << 37,
 };
 
 /// Options that control how a run works, but not what a source is converted to. All others are part of a
 /// plan, and of what --resume compares: one too many there costs time, one too few would keep outdated
 /// results.
 inline constexpr uint64_t kHowToRun = kOutput | kOutputFolder | kForce | kSkipExisting | kDryRun |
-                                      kKeepGoing | kDataFolder | kJson | kQuiet | kJobs | kFilesFrom | kNull |
-                                      kResume | kReport | kTimeLimit | kShards | kShard;
+                                      kKeepGoing | kDataFolder | kJson | kQuiet | kVerbose | kJobs |
+                                      kFilesFrom | kNull | kResume | kReport | kTimeLimit | kShards | kShard;
 
 /// One command of the program.
 struct ShellCommand

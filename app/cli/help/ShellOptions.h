@@ -32,6 +32,7 @@ struct ShellOptions
     std::string output;       ///< -o
     std::string outputFolder; ///< --out-dir
     std::string profile;      ///< display name, or path of a .prf file
+    std::string drafts;       ///< --drafts, the folder that keeps drafted profiles; empty to keep none
     std::string dataFolder;   ///< replaces the folder next to the executable; empty for that folder
     std::string job;          ///< htr or orn
     std::string html;         ///< --html, the page to write; empty for no page
@@ -53,6 +54,7 @@ struct ShellOptions
 
     bool json = false;
     bool quiet = false;
+    bool verbose = false;       ///< one line per source of a run
     bool force = false;         ///< replace existing outputs
     bool skipExisting = false;  ///< skip sources whose output exists
     bool dryRun = false;        ///< only print what would be done
@@ -63,6 +65,8 @@ struct ShellOptions
     bool align = false;         ///< first re-express the source relative to a T-pose
     bool faithful = false;      ///< keep trunk, hips, knees, feet and hands close to the source
     bool noHands = false;       ///< but not the hands
+    bool draft = false;         ///< draft a profile if none fits; set by --drafts too
+    bool mend = false;          ///< read sources repaired, if that is safe
     bool check = false;         ///< measure each result
     bool objects = false;       ///< print all spatial objects, not only nodes
 };

@@ -131,9 +131,9 @@ void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured)
     WriteWorst(json, FindWorstFrames(measured.sums, measured.detail, kWorstFrames));
 }
 
-void WriteKeyFigures(CJsonWriter& json, const MeasuredConversion& measured)
+void WriteKeyFigures(CJsonWriter& json, const MeasuredConversion& measured, const char* key)
 {
-    json.Key("figures").BeginObject();
+    json.Key(key).BeginObject();
     for (const KeyFigure& figure : KeyFiguresOf(measured.sums, measured.detail))
     {
         json.Key(figure.key);

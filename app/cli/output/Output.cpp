@@ -3,6 +3,7 @@
 #include "CJsonWriter.h"
 #include "CSafeFile.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -26,7 +27,21 @@ bool IsTaken(const std::string& path)
 
 Notice UnreadableFolder(const std::string& path)
 {
-    return MakeNotice(path, "unreadable-folder", "the folder cannot be read (check its permissions)");
+    std::error_code error;
+    const std::filesystem::directory_iterator entries(path, error);
+    return MakeNotice(path, "unreadable-folder",
+                      "the folder cannot be read" + SystemErrorWords(error.value()));
+}
+
+std::optional<Notice> WhyNoSource(const std::string& path)
+{
+    if (FolderExists(path))
+        return UnreadableFolder(path);
+    if (!IsLink(path) || FileExists(path))
+        return std::nullopt;
+    std::error_code error;
+    const std::string target = std::filesystem::read_symlink(path, error).string();
+    return MakeNotice(path, "dead-link", "a link to a file that does not exist: " + Quoted(target));
 }
 
 bool CanListFolder(const ShellOptions& options, const std::string& path)

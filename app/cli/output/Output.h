@@ -15,6 +15,9 @@ bool IsDecidedOnExisting(const ShellOptions& options);
 bool IsTaken(const std::string& path);
 /// Returns the failure for a folder whose files cannot be listed.
 Notice UnreadableFolder(const std::string& path);
+/// Returns why a path in a list of sources is none: a folder that could not be read, in place of its files,
+/// or a link to a file that does not exist.
+std::optional<Notice> WhyNoSource(const std::string& path);
 /// Returns whether the files of a folder can be listed; prints an error if not.
 bool CanListFolder(const ShellOptions& options, const std::string& path);
 /// Returns whether two paths refer to the same existing file.

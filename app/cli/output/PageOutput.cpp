@@ -3,6 +3,7 @@
 #include "CConversionPage.h"
 #include "Output.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -34,10 +35,8 @@ bool WritePage(const ShellOptions& options, CConversionPage& page)
 {
     if (!page.Write(options.html))
     {
-        SayError(
-            Printable(options.html) +
-            ": the page cannot be written (check the path, the permissions, and the free space on the disk "
-            "and in the folder for temporary files)");
+        SayError(Printable(options.html) + ": the page, or one of its temporary files, cannot be written" +
+                 TakeSystemErrorWords());
         return false;
     }
     SayWord(options, "page: " + Printable(options.html));

@@ -4,6 +4,7 @@
 #include "FindingWords.h"
 #include "Notice.h"
 #include "ShellOptions.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <cstdio>
@@ -40,6 +41,11 @@ void SayNotice(const ShellOptions& options, const Notice& notice)
 void SayFailure(const std::string& path, const Finding& failure)
 {
     SayError(NoticeLine(MakeNotice(path, failure)));
+}
+
+void SayNotWritten(const std::string& path)
+{
+    SayFailure(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()});
 }
 
 void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record)

@@ -20,6 +20,8 @@ void SayWord(const ShellOptions& options, std::string_view words);
 void SayNotice(const ShellOptions& options, const Notice& notice);
 /// Prints the failure recorded by a file's reader or writer.
 void SayFailure(const std::string& path, const Finding& failure);
+/// Prints that a file cannot be written, with the system's reason.
+void SayNotWritten(const std::string& path);
 /// Prints all recorded warnings.
 void SayWarnings(const ShellOptions& options, const std::string& path, const CFailureRecord& record);
 

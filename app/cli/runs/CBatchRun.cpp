@@ -6,6 +6,7 @@
 #include "CJsonWriter.h"
 #include "CShellConversion.h"
 #include "CShellNotices.h"
+#include "CheckText.h"
 #include "NoticeJson.h"
 #include "StringTable.h"
 #include "Text.h"
@@ -29,14 +30,18 @@ CBatchRun::CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CSh
 // The profile is read from its file again for every source, unless it was adapted and has no file.
 EBatchStep CBatchRun::ConvertMotion(const ConversionJob& job)
 {
-    if (!conversion_.LoadSource(job.source))
+    if (!conversion_.ReadSource(job.source))
         return EBatchStep::Ended;
     conversion_.LoadTarget();
     if (!conversion_.IsAdapted())
         conversion_.RereadProfile();
     if (!conversion_.Convert(true))
         return EBatchStep::Abandoned;
-    return conversion_.WriteBatchResult(job.output) ? EBatchStep::Done : EBatchStep::Ended;
+    if (!conversion_.WriteBatchResult(job.output))
+        return EBatchStep::Ended;
+    if (Options().check)
+        check_ = MeasureMotion(MotionOf(conversion_, job), conversion_.ProfilePath());
+    return EBatchStep::Done;
 }
 
 EBatchStep CBatchRun::RunJob(const ConversionJob& job)
@@ -54,14 +59,19 @@ EBatchStep CBatchRun::RunJob(const ConversionJob& job)
 CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     const ConversionJob& job = AllJobs()[index];
-    SayWord(Options(), Printable(job.source) + " (" + std::to_string(index + 1) + " of " +
-                           std::to_string(AllJobs().size()) + ')');
+    check_.reset();
+    if (IsEachTold())
+        SayWord(Options(), Printable(job.source) + " (" + std::to_string(index + 1) + " of " +
+                               std::to_string(AllJobs().size()) + ')');
+    ownNotices_.SetVoice(Voice());
     const size_t before = ownNotices_.All().size();
     const EBatchStep step = RunJob(job);
     const auto notices = std::span(ownNotices_.All()).subspan(before);
     const bool good = step == EBatchStep::Done && std::ranges::all_of(notices, &Notice::IsWarning);
     const EConversion outcome = good ? EConversion::Converted : EConversion::Failed;
     WriteRecord(index, outcome, notices, record);
+    if (check_ && IsEachTold() && !options.quiet && !options.json)
+        PrintCheck(*check_, "check");
     const bool endsRun = step != EBatchStep::Done && !options.keepGoing;
     return {outcome, endsRun, endsRun && step == EBatchStep::Abandoned};
 }
@@ -78,20 +88,26 @@ void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const N
     json.Key("profile").Text(converts ? conversion_.Profile().name : "");
     json.Key("profilePath").Text(converts ? conversion_.ProfilePath() : "");
     json.Key("frames").Integer(converts ? conversion_.Result().GetKeyCount() : 0);
+    if (const std::string mended = conversion_.Mended().Words(); !mended.empty())
+        json.Key("mended").Text(mended);
     WriteNotices(json, {notices.begin(), notices.end()});
+    if (check_)
+        WriteKeyFigures(json, *check_, "figures");
     json.EndObject();
     json.EndDocument();
 }
 
 void CBatchRun::TellLost(size_t index, const Notice& reason, std::FILE* record)
 {
-    SayNotice(Options(), reason);
+    if (Voice() != EVoice::Silent)
+        SayNotice(Options(), reason);
     WriteRecord(index, EConversion::Failed, {&reason, 1}, record);
 }
 
 void CBatchRun::TellUpToDate(size_t index)
 {
-    SayWord(Options(), Printable(AllJobs()[index].source) + ": skipped, the output is up to date");
+    if (IsEachTold())
+        SayWord(Options(), Printable(AllJobs()[index].source) + ": skipped, the output is up to date");
 }
 
 bool CBatchRun::AddProfiles(CContentHash& key)
@@ -113,6 +129,8 @@ bool CBatchRun::TellEnd()
 {
     const bool good = !IsAbandoned() && Tally()[EConversion::Failed] == 0;
     const int message = BatchJobOf(Options()) == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage;
+    if (!Options().json && !IsEachTold())
+        TellSummary();
     const std::string count[] = {std::to_string(Tally()[EConversion::Converted])};
     if (!IsAbandoned())
         SayWord(Options(), FormatText(conversion_.Message(message), count));

@@ -1,9 +1,11 @@
 #pragma once
 
 #include "CFileRun.h"
+#include "CheckResult.h"
 #include "Notice.h"
 #include "ResultFile.h"
 
+#include <optional>
 #include <span>
 
 namespace gw {
@@ -40,7 +42,8 @@ private:
     void WriteRecord(size_t index, EConversion outcome, std::span<const Notice> notices, std::FILE* record);
 
     CShellConversion& conversion_;
-    CShellNotices& ownNotices_; ///< of this process
+    CShellNotices& ownNotices_;               ///< of this process
+    std::optional<MeasuredConversion> check_; ///< in a worker: of the current source, with --check
     std::vector<Notice> m_kNotices;
     size_t m_uiTaken = 0;
 };

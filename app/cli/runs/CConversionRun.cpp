@@ -23,20 +23,23 @@ std::string OutcomeWords(EConversion outcome)
 CFileRun::FileEnd CConversionRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     CPagePart part(index + 1, AllJobs().size());
-    const EConversion outcome =
-        ConvertFile(options, AllJobs()[index], record, IsPageAsked(options) ? &part : nullptr);
+    const EConversion outcome = ConvertFile(options, AllJobs()[index],
+                                            {.record = record,
+                                             .part = IsPageAsked(options) ? &part : nullptr,
+                                             .drafts = Drafts(),
+                                             .voice = Voice()});
     m_kDrawn = part.ToText();
     return {.outcome = outcome, .endsRun = outcome == EConversion::Failed && !options.keepGoing};
 }
 
 void CConversionRun::TellLost(size_t index, const Notice& reason, std::FILE* record)
 {
-    TellFailed(Options(), AllJobs()[index], reason, record);
+    TellFailed(Options(), AllJobs()[index], reason, {.record = record, .voice = Voice()});
 }
 
 void CConversionRun::TellUpToDate(size_t index)
 {
-    TellSkipped(Options(), AllJobs()[index], "the output is up to date");
+    TellSkipped(Options(), AllJobs()[index], "the output is up to date", Voice());
 }
 
 // Adds the named profile, or all profiles that sources may choose from.
@@ -83,7 +86,7 @@ bool CConversionRun::FinishPage()
 
 bool CConversionRun::TellEnd()
 {
-    TellTally(Options(), Tally());
+    TellSummary();
     const bool isWritten = !IsPageAsked(Options()) || FinishPage();
     return isWritten && Tally()[EConversion::Failed] == 0;
 }

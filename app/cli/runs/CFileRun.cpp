@@ -1,13 +1,13 @@
-// A run of many conversions. Workers convert; the program prints, writes reports and keeps the state for
-// --resume. Whether a source is up to date is decided by a key: a hash of program version, options, profiles,
-// skeleton and source. The steps around saving a result are ordered so that a crash at any point neither
-// loses a result nor records one that does not exist; see CResumeState.h.
+// The program's side of a run of many conversions: it prints, writes reports and keeps the state for
+// --resume, while workers convert (CFileRunWorker.cpp). Whether a source is up to date is decided by a key: a
+// hash of program version, options, profiles, skeleton and source. The steps around saving a result are
+// ordered so that a crash at any point neither loses a result nor records one that does not exist; see
+// CResumeState.h.
 
 #include "CFileRun.h"
 
 #include "CContentHash.h"
 #include "CFilePlatform.h"
-#include "CJsonWriter.h"
 #include "CSafeFile.h"
 #include "CTextFile.h"
 #include "CWorkerPool.h"
@@ -17,70 +17,24 @@
 #include "Output.h"
 #include "Paths.h"
 #include "PrivateNames.h"
+#include "RunRecord.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
 #include <algorithm>
-#include <charconv>
-#include <chrono>
-#include <cstring>
-#include <new>
 #include <numeric>
 #include <set>
 #include <thread>
-
-#include <sys/wait.h>
 
 namespace gw {
 
 namespace {
 
-constexpr uint8_t kEndsRun = 0x80;
-constexpr uint8_t kAbandons = 0x40;
-constexpr uint8_t kOutcomeBits = 0x0f;
-
 size_t WorkerCount(const ShellOptions& options, size_t jobCount)
 {
     const size_t cores = std::max(1u, std::thread::hardware_concurrency());
     return std::min(options.jobs ? static_cast<size_t>(*options.jobs) : cores, jobCount);
-}
-
-// Returns the members of a record that differ between runs; the rest is the same in every run.
-std::string RecordHead(const ConversionJob& job)
-{
-    CTextFile text;
-    {
-        CJsonWriter json(text.File());
-        json.BeginObject();
-        json.Key("source").Text(job.source);
-        json.Key("output").Text(job.output);
-    }
-    return text.Text() + ',';
-}
-
-// Returns a writer's record, still open at the end, with the job's duration added.
-std::string Timed(std::string record, double seconds)
-{
-    record.resize(std::min(record.size(), record.rfind('}')));
-    char digits[64];
-    char* const end = std::to_chars(digits, std::end(digits), seconds, std::chars_format::fixed, 4).ptr;
-    return record + ",\"seconds\":" + std::string(&digits[0], end);
-}
-
-Notice LostNotice(const ConversionJob& job, const JobEnd& end, float limit)
-{
-    if (end.kind == JobEnd::EKind::TimedOut)
-        return MakeNotice(job.source, "time-limit",
-                          "not done within " + std::to_string(static_cast<int64_t>(limit)) +
-                              " seconds, so it was stopped; use --time-limit to allow more");
-    if (end.kind == JobEnd::EKind::Ran)
-        return MakeNotice(job.source, "no-record",
-                          "the messages about it cannot be stored (is there a limit on the size of "
-                          "files?)");
-    const std::string cause = WIFSIGNALED(end.status)
-                                  ? std::string(strsignal(WTERMSIG(end.status)))
-                                  : "exit code " + std::to_string(WEXITSTATUS(end.status));
-    return MakeNotice(job.source, "crashed", "the conversion crashed (" + cause + "); nothing was written");
 }
 
 void Emit(const std::string& text, std::FILE* file)
@@ -119,7 +73,18 @@ bool CFileRun::Open()
         return false;
     if (!options_.dryRun)
         SweepLeftovers();
+    if (options_.draft)
+        m_kDrafts.emplace(DraftFolder(), m_kJobs.size());
     return true;
+}
+
+// A resumed run needs the drafts of the runs before it. A dry run keeps none.
+std::string CFileRun::DraftFolder() const
+{
+    if (options_.dryRun)
+        return {};
+    return options_.drafts.empty() && options_.resume ? m_kState.folder + ".gaitwright.drafts"
+                                                      : options_.drafts;
 }
 
 bool CFileRun::OpenReport()
@@ -133,7 +98,7 @@ bool CFileRun::OpenReport()
     }
     if (m_kReport.Open(options_.report, CReportFile::EStart::Empty))
         return true;
-    SayError(Printable(options_.report) + ": the report cannot be written");
+    SayError(Printable(options_.report) + ": the report cannot be written" + TakeSystemErrorWords());
     return false;
 }
 
@@ -155,7 +120,7 @@ bool CFileRun::OpenState()
 {
     const CFilePlatform platform(EPlatformWriting::No, options_.dataFolder);
     CContentHash key;
-    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(options_, ~(kHowToRun | kProfile)));
+    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(options_, ~(kHowToRun | kProfile | kDrafts)));
     for (const char* file : {"base.htr", "KsBone.bsm"})
         key.AddFile(platform.DataFolder() + file);
     if (!AddProfiles(key)) // by content, not by name
@@ -165,7 +130,8 @@ bool CFileRun::OpenState()
     if (options_.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
         return true;
     SayError(Printable(m_kState.folder) +
-             ": the records of the run cannot be written here, so --resume cannot work");
+             ": the records of the run cannot be written here, so --resume cannot work" +
+             TakeSystemErrorWords());
     return false;
 }
 
@@ -189,7 +155,8 @@ EExit CFileRun::Finish(bool ran, int requests)
     const bool isSynced = SyncResults();
     const bool good = TellEnd() && isSynced;
     if (m_bReportFailed)
-        SayError(Printable(options_.report) + ": the end of the report cannot be written");
+        SayError(Printable(options_.report) + ": the end of the report cannot be written" +
+                 SystemErrorWords(m_iReportError));
     if (requests > 0)
         return EExit::Interrupted;
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
@@ -203,123 +170,28 @@ bool CFileRun::SyncResults()
     const std::string failed = m_kSync.Sync();
     const bool isSynced = failed.empty();
     if (!isSynced)
-        SayError(Printable(failed) +
-                 ": the disk reports a failed write; this result or others of the run may be "
-                 "damaged");
+        SayError(Printable(failed) + ": the disk reports a failed write" + TakeSystemErrorWords() +
+                 "; this result or others of the run may be damaged");
     const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
     if (isSynced && isNews && options_.resume && !options_.dryRun)
         m_kResume.AddSynced();
     return isSynced;
 }
 
-// Called in a worker.
-
-uint8_t CFileRun::Run(size_t index, std::FILE* record)
-{
-    const ConversionJob& job = m_kJobs[index];
-    CSafeFile::DeferSyncs(IsSyncDeferred());
-    if (!options_.dryRun)
-        CreateFolder(FolderOf(job.output));
-    std::string line;
-    const FileEnd end = options_.resume ? ConvertResumed(index, line) : ConvertGuarded(options_, index, line);
-    Emit(line + "}\n" + Enclosure(), record);
-    return static_cast<uint8_t>(static_cast<uint8_t>(end.outcome) | (end.endsRun ? kEndsRun : 0) |
-                                (end.abandons ? kAbandons : 0));
-}
-
-CFileRun::FileEnd CFileRun::ConvertGuarded(const ShellOptions& options, size_t index, std::string& line)
-{
-    const auto start = std::chrono::steady_clock::now();
-    CTextFile text;
-    FileEnd end{.endsRun = !options.keepGoing};
-    try
-    {
-        // A folder in the list could not be read; it is reported in place of its files.
-        if (FolderExists(m_kJobs[index].source))
-            TellLost(index, UnreadableFolder(m_kJobs[index].source), text.File());
-        else
-            end = Convert(options, index, text.File());
-    } catch (const std::bad_alloc&)
-    {
-        TellLost(index, MakeNotice(m_kJobs[index].source, "memory", "there is not enough memory"),
-                 text.File());
-    }
-    const std::chrono::duration<double> seconds = std::chrono::steady_clock::now() - start;
-    line = Timed(text.Text(), seconds.count());
-    return end;
-}
-
-CFileRun::FileEnd CFileRun::ConvertResumed(size_t index, std::string& line)
-{
-    const ConversionJob& job = m_kJobs[index];
-    const std::string name = NameInState(job);
-    const std::string key = KeyOf(job);
-    const std::string head = RecordHead(job);
-    const std::string digits = FileDigits(job.output);
-    if (const std::string* told = m_kResume.FindTold(name, key, digits))
-    {
-        TellUpToDate(index);
-        line = head + *told + ",\"resumed\":true";
-        return {.outcome = EConversion::Skipped};
-    }
-    ShellOptions options = options_;
-    if (!options.force && m_kResume.Knows(name) && FileExists(job.output))
-    {
-        if (!m_kResume.IsOwn(name, digits, ModificationDigits(job.output)))
-            return KeepChanged(index, line);
-        options.force = true;
-    }
-    const FileEnd end = ConvertGuarded(options, index, line);
-    if (end.outcome == EConversion::Converted)
-        m_kResume.AddMade(name, key, m_kReadyDigits, m_kReadyModified,
-                          line.substr(std::min(head.size(), line.size())));
-    return end;
-}
-
-CFileRun::FileEnd CFileRun::KeepChanged(size_t index, std::string& line)
-{
-    CTextFile text;
-    TellLost(index,
-             MakeNotice(m_kJobs[index].output, "changed",
-                        "this file was changed after the run wrote it, so it was kept; --force replaces it"),
-             text.File());
-    line = Timed(text.Text(), 0.0);
-    return {.endsRun = !options_.keepGoing};
-}
-
-void CFileRun::Ready(size_t index, const std::string& privatePath)
-{
-    if (!options_.resume)
-        return;
-    m_kReadyDigits = FileDigits(privatePath);
-    m_kReadyModified = ModificationDigits(privatePath);
-    m_kResume.AddReady(NameInState(m_kJobs[index]), m_kReadyDigits, m_kReadyModified);
-}
-
-std::string CFileRun::KeyOf(const ConversionJob& job) const
-{
-    return CContentHash().AddText(m_kCommonKey).AddText(NameInState(job)).AddFile(job.source).Digits();
-}
-
-// Returns a name that does not depend on the current folder.
-std::string CFileRun::NameInState(const ConversionJob& job) const
-{
-    return job.output.starts_with(m_kState.folder) ? job.output.substr(m_kState.folder.size()) : job.output;
-}
-
-// Called in the program.
-
 void CFileRun::Lost(size_t index)
 {
+    if (m_kDrafts)
+        m_kDrafts->Settle(index);
     RemoveLeftovers(FolderOf(m_kJobs[index].output));
 }
 
 bool CFileRun::Take(size_t index, const JobEnd& end)
 {
-    m_kBar.Clear();
+    const bool lost = end.kind != JobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
+    if (lost || !end.words.empty() || !end.output.empty())
+        m_kBar.Clear();
     Emit(end.words, stderr);
     Emit(end.output, stdout);
-    const bool lost = end.kind != JobEnd::EKind::Ran || end.record.find('\n') == end.record.npos;
     const std::string record = lost ? TakeLost(index, end) : end.record;
     std::fflush(stdout);
     const auto outcome = lost ? EConversion::Failed : static_cast<EConversion>(end.answer & kOutcomeBits);
@@ -331,6 +203,7 @@ bool CFileRun::Take(size_t index, const JobEnd& end)
     std::string_view line;
     NextLine(enclosure, line);
     AddToReport(line);
+    m_kSummary.Take(m_kJobs[index].source, outcome, line);
     TakeRecord(index, outcome, line, enclosure);
     return lost ? options_.keepGoing : (end.answer & kEndsRun) == 0;
 }
@@ -344,8 +217,10 @@ std::string CFileRun::TakeLost(size_t index, const JobEnd& end)
 
 void CFileRun::AddToReport(std::string_view line)
 {
-    if (m_kReport.IsOpen() && !m_kReport.AddLine(line))
-        m_bReportFailed = true;
+    if (!m_kReport.IsOpen() || m_bReportFailed || m_kReport.AddLine(line))
+        return;
+    m_bReportFailed = true;
+    m_iReportError = TakeSystemError();
 }
 
 void CFileRun::Tick(size_t ended)

@@ -1,11 +1,13 @@
 #pragma once
 
 #include "CDeferredSync.h"
+#include "CDraftShelf.h"
 #include "CInterrupt.h"
 #include "CJobHandler.h"
 #include "CProgressBar.h"
 #include "CReportFile.h"
 #include "CResumeState.h"
+#include "CRunSummary.h"
 #include "RunTally.h"
 
 #include <optional>
@@ -73,19 +75,40 @@ protected:
 
     const ShellOptions& Options() const { return options_; }
     const Jobs& AllJobs() const { return m_kJobs; }
+    /// Returns where drafted profiles are kept; null without the option --draft.
+    CDraftShelf* Drafts() { return m_kDrafts ? &*m_kDrafts : nullptr; }
+    /// Returns what a source prints. Many print nothing, because the summary does, but a failure that ends
+    /// the run is printed in full.
+    EVoice Voice() const
+    {
+        if (options_.verbose || m_kJobs.size() == 1)
+            return EVoice::Speaks;
+        return options_.keepGoing ? EVoice::Silent : EVoice::Failures;
+    }
+    /// Returns whether a source prints its result.
+    bool IsEachTold() const { return Voice() == EVoice::Speaks; }
+    /// Prints the summary.
+    void TellSummary() const { m_kSummary.Tell(options_, m_kTally, Voice() != EVoice::Silent); }
     bool IsAbandoned() const { return m_bAbandoned; }
 
 private:
+    // The answer of a worker: an outcome and two bits.
+    static constexpr uint8_t kEndsRun = 0x80;
+    static constexpr uint8_t kAbandons = 0x40;
+    static constexpr uint8_t kOutcomeBits = 0x0f;
+
     bool Open();
     bool OpenReport();
     std::optional<Notice> WhyNotReport() const;
     bool OpenState();
+    std::string DraftFolder() const;
     bool IsSyncDeferred() const { return m_kJobs.size() > 1; }
     bool SyncResults();
     void SweepLeftovers() const;
     EExit Finish(bool ran, int requests);
     FileEnd ConvertGuarded(const ShellOptions& options, size_t index, std::string& line);
     FileEnd ConvertResumed(size_t index, std::string& line);
+    bool IsDraftSame(const std::string& told) const;
     FileEnd KeepChanged(size_t index, std::string& line);
     std::string KeyOf(const ConversionJob& job) const;
     std::string NameInState(const ConversionJob& job) const;
@@ -102,9 +125,12 @@ private:
     CReportFile m_kReport;
     CDeferredSync m_kSync;
     CProgressBar m_kBar;
+    std::optional<CDraftShelf> m_kDrafts;
+    CRunSummary m_kSummary;
     RunTally m_kTally;
     bool m_bAbandoned = false;
     bool m_bReportFailed = false;
+    int m_iReportError = 0; ///< errno of the failed write
 };
 
 } // namespace gw

@@ -1,19 +1,26 @@
 // Chooses the bone map of a conversion. A named one is used as it is. Without a name, a stock map is used if
 // all its rows match the source, for compatibility. Otherwise the best installed map is used, unless the
-// joint positions contradict it: then the user must name it.
+// joint positions contradict it: then the user must name it. With --draft, a map is drafted for the skeleton
+// instead of giving up.
 
 #include "CShellConversion.h"
 
+#include "CDraftShelf.h"
 #include "CShellNotices.h"
 #include "DoubtWords.h"
+#include "DraftedProfile.h"
 #include "FindBone.h"
 #include "FindingWords.h"
+#include "HelpWords.h"
 #include "Paths.h"
 #include "ProfileChoice.h"
 #include "ProfileFile.h"
 #include "ProfileFit.h"
+#include "ProfileNames.h"
 #include "ShellOptions.h"
 #include "StringTable.h"
+#include "SuggestProfile.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -55,9 +62,19 @@ CShellConversion::CShellConversion(const ShellOptions& options, const Conversion
 {
 }
 
+bool CShellConversion::ReadSource(const std::string& path)
+{
+    if (!options_.mend || m_kMended.Mend(path))
+        return LoadSource(path, m_kMended.Path());
+    Notify(MakeNotice(path, "no-mended-copy",
+                      "a repaired copy cannot be written to the folder for temporary files" +
+                          TakeSystemErrorWords()));
+    return false;
+}
+
 bool CShellConversion::Open(const std::string& path)
 {
-    if (!LoadSource(path) || !LoadTarget())
+    if (!ReadSource(path) || !LoadTarget())
         return false;
     if (options_.profile.empty())
         PickStockProfile();
@@ -130,7 +147,7 @@ std::string CShellConversion::ResolveProfile(const std::string& nameOrFile)
     if (ReadProfileText(nameOrFile, text))
         return nameOrFile;
     if (HasExtension(nameOrFile, ".prf") || FileExists(nameOrFile))
-        Notify(MakeNotice(nameOrFile, {EFailure::BadProfile}));
+        Notify(MakeNotice(nameOrFile, {.reason = EFailure::BadProfile, .systemError = TakeSystemError()}));
     else
         Notify(NotInstalled(nameOrFile, InstalledProfiles()));
     return {};
@@ -145,8 +162,7 @@ bool CShellConversion::SelectProfile()
     }
     if (ProfilePath().empty())
         return SelectFitting();
-    WarnOfStockPick();
-    return true;
+    return SelectStockPick();
 }
 
 std::vector<ProfileChoice> CShellConversion::Choices(EJudged judged)
@@ -190,31 +206,39 @@ bool CShellConversion::SelectFitting()
     }
     if (!choices.empty() && choices.front().match.IsWhole())
         return Take(choices.front());
+    if (UseDraft())
+        return true;
     nearest_.emplace();
     if (!choices.empty())
         Measure(choices.front().path, *nearest_);
-    Notify(NoneFitsNotice(SourcePath(), *nearest_));
+    NotifyWithDraft(NoneFitsNotice(SourcePath(), *nearest_));
     return false;
 }
 
-// For compatibility, a stock profile is used whenever its rows fit, so doubts about it are only warnings.
-void CShellConversion::WarnOfStockPick() const
+// For compatibility, a stock profile is used whenever its rows fit, so doubts about it are only warnings. A
+// draft is better than a doubtful one.
+bool CShellConversion::SelectStockPick()
 {
     const std::string path[] = {ProfilePath()};
     for (ProfileChoice& choice : ChooseProfile(path, *SourceRoot(), *Result().motionRoot))
     {
+        if (choice.verdict.sureness == ESureness::Doubtful && UseDraft())
+            return true;
         std::erase_if(choice.verdict.doubts,
                       [](const ProfileDoubt& doubt) { return !IsOfRoles(doubt.kind); });
         for (const Notice& warning : DoubtWarnings(SourcePath(), choice))
             Notify(warning);
     }
+    return true;
 }
 
 bool CShellConversion::Take(const ProfileChoice& choice)
 {
     if (choice.verdict.sureness == ESureness::Doubtful)
     {
-        Notify(DoubtfulNotice(SourcePath(), choice));
+        if (UseDraft())
+            return true;
+        NotifyWithDraft(DoubtfulNotice(SourcePath(), choice));
         return false;
     }
     for (const Notice& warning : DoubtWarnings(SourcePath(), choice))
@@ -222,6 +246,49 @@ bool CShellConversion::Take(const ProfileChoice& choice)
     chosen_ = choice;
     UseProfile(choice.path, choice.profile);
     return true;
+}
+
+// Uses the draft of the source's skeleton: one that an earlier source got, or a new one if all of its main
+// rows are sure.
+bool CShellConversion::UseDraft()
+{
+    constexpr size_t kStemCharacters = 60; // far below the limit of file systems, with the digits behind it
+    if (!options_.draft || !m_pkDrafts)
+        return false;
+    const std::string skeleton = SkeletonDigits(*SourceRoot());
+    std::string path = m_pkDrafts->Find(skeleton);
+    if (path.empty())
+    {
+        const SuggestedProfile draft = SuggestProfile(*SourceRoot(), *Result().motionRoot);
+        m_kWhyNoDraft = WhyNotSure(draft);
+        m_bDraftUnsure = draft.missing.empty() && !m_kWhyNoDraft.empty();
+        if (!m_kWhyNoDraft.empty())
+            return false;
+        const std::string stem = SplitPath(SourcePath()).stem;
+        path = m_pkDrafts->Keep(skeleton, FirstCharacters(stem, kStemCharacters),
+                                DraftText(draft, stem, SourceRoot()));
+    }
+    if (path.empty())
+        m_kWhyNoDraft = "the drafted profile cannot be written" + TakeSystemErrorWords();
+    m_bDrafted = !path.empty() && UseProfile(path);
+    if (const std::optional<Notice> warning = RateWarning(SourcePath(), SourceRoot()); m_bDrafted && warning)
+        Notify(*warning);
+    return m_bDrafted;
+}
+
+// Adds why there is no draft, or how to get one.
+void CShellConversion::NotifyWithDraft(Notice notice) const
+{
+    const std::string source = ShellWord(SourcePath());
+    const std::string map = ShellWord(SplitPath(SourcePath()).stem + ".prf");
+    notice = WithHelp(options_, std::move(notice));
+    if (!m_kWhyNoDraft.empty())
+        notice.words += "\n  no draft was used: " + m_kWhyNoDraft;
+    else if (!options_.draft)
+        notice.words += "\n  --draft makes a profile for this skeleton";
+    if (!options_.draft || m_bDraftUnsure)
+        notice.words += "; to check one first: gaitwright suggest " + source + " -o " + map;
+    Notify(notice);
 }
 
 bool CShellConversion::Measure(const std::string& profilePath, CProfileFit& fit) const

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CFileConversion.h"
+#include "CMendedSource.h"
 #include "CProfileTexts.h"
 #include "ChooseProfile.h"
 #include "ProfileFit.h"
@@ -13,6 +14,7 @@
 
 namespace gw {
 
+class CDraftShelf;
 class CShellNotices;
 struct ShellOptions;
 
@@ -34,6 +36,12 @@ public:
     /// Options and notices must outlive the conversion.
     CShellConversion(const ShellOptions& options, const ConversionChoices& choices, CShellNotices& notices);
 
+    /// With the option --draft: where drafted profiles are found and kept. Must outlive the conversion.
+    void UseDrafts(CDraftShelf& drafts) { m_pkDrafts = &drafts; }
+
+    /// Reads a source, repaired if the options say so. Returns false, after reporting the reason, if that
+    /// fails.
+    bool ReadSource(const std::string& path);
     /// Opens a source and loads the target. If no profile was named, selects a stock profile that fits.
     /// Returns false, after reporting the reason, if anything failed.
     bool Open(const std::string& path);
@@ -51,6 +59,10 @@ public:
     /// Returns the chosen profile; no value for a named profile or an original stock profile.
     const std::optional<ProfileChoice>& Chosen() const { return chosen_; }
     bool IsAdapted() const { return chosen_ && chosen_->adapted; }
+    /// Returns whether the profile was drafted for the source's skeleton.
+    bool IsDrafted() const { return m_bDrafted; }
+    /// Returns the copy that was read in place of the source, and what was repaired in it.
+    const CMendedSource& Mended() const { return m_kMended; }
     /// Returns how well the closest profile fits if none fits fully.
     const std::optional<CProfileFit>& Nearest() const { return nearest_; }
     /// Measures how a profile fits the open source. Returns false if its file cannot be read.
@@ -62,7 +74,9 @@ private:
     void PickStockProfile();
     bool SelectFitting();
     bool IsAsInFile(const std::string& profilePath);
-    void WarnOfStockPick() const;
+    bool SelectStockPick();
+    bool UseDraft();
+    void NotifyWithDraft(Notice notice) const;
     bool Take(const ProfileChoice& choice);
 
     const ShellOptions& options_;
@@ -72,6 +86,11 @@ private:
     std::optional<std::vector<InstalledProfile>> installed_; ///< set when first needed
     std::optional<ProfileChoice> chosen_;
     std::optional<CProfileFit> nearest_;
+    CMendedSource m_kMended;
+    CDraftShelf* m_pkDrafts = nullptr;
+    bool m_bDrafted = false;
+    std::string m_kWhyNoDraft;   ///< empty if no draft was tried
+    bool m_bDraftUnsure = false; ///< there is one that a person could check
 };
 
 } // namespace gw

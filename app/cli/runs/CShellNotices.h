@@ -1,6 +1,8 @@
 #pragma once
 
 #include "CFileConversion.h"
+#include "ConvertFile.h"
+#include "HelpWords.h"
 #include "Words.h"
 
 #include <vector>
@@ -15,16 +17,24 @@ class CShellNotices
 {
 public:
     /// The options must outlive the notices.
-    explicit CShellNotices(const ShellOptions& options) : options_(options) {}
-
-    void Add(const Notice& notice)
+    explicit CShellNotices(const ShellOptions& options, EVoice voice = EVoice::Speaks)
+        : options_(options), voice_(voice)
     {
-        SayNotice(options_, notice);
+    }
+
+    void Add(const Notice& told)
+    {
+        const Notice notice = WithHelp(options_, told);
+        if (voice_ == EVoice::Speaks || (voice_ == EVoice::Failures && !notice.IsWarning()))
+            SayNotice(options_, notice);
         if (notice.code == kFixedMessage)
             return;
         notices_.push_back(notice);
         hasFailed_ = hasFailed_ || !notice.IsWarning();
     }
+    /// Changes which notices are printed; all are still kept.
+    void SetVoice(EVoice voice) { voice_ = voice; }
+    EVoice Voice() const { return voice_; }
     /// Returns whether any notice is not a warning.
     bool HasFailed() const { return hasFailed_; }
     /// Returns all notices, in order.
@@ -34,6 +44,7 @@ private:
     const ShellOptions& options_;
     std::vector<Notice> notices_;
     bool hasFailed_ = false;
+    EVoice voice_;
 };
 
 } // namespace gw

@@ -1,7 +1,7 @@
 #include "CheckResult.h"
 
-#include "CFileConversion.h"
 #include "CKeyframeControl.h"
+#include "CShellConversion.h"
 #include "ConvertFile.h"
 #include "HTRPose.h"
 #include "ShellOptions.h"
@@ -39,16 +39,21 @@ std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, c
     return measured.sums.frameCount > 0 ? std::optional(std::move(measured)) : std::nullopt;
 }
 
-std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options, const ConversionJob& job,
-                                                    const std::string& profilePath)
+ConversionChoices ChoicesOf(const ShellOptions& options)
 {
-    if (!options.align && !options.faithful)
+    return {options.align, options.faithful, !options.noHands};
+}
+
+std::optional<MeasuredConversion> MeasureAnew(const ShellOptions& options, const ConversionChoices& choices,
+                                              const ConversionJob& job, const CShellConversion& done)
+{
+    CFileConversion conversion(options.dataFolder, choices, [](const Notice&) {});
+    if (!conversion.LoadSource(job.source, done.Mended().Path()) || !conversion.LoadTarget())
         return std::nullopt;
-    CFileConversion conversion(options.dataFolder, {}, [](const Notice&) {});
-    if (!conversion.LoadSource(job.source) || !conversion.LoadTarget() ||
-        !conversion.UseProfile(profilePath) || !conversion.Convert(!options.noLegs))
+    conversion.UseProfile(done.ProfilePath(), done.Profile());
+    if (!conversion.Convert(!options.noLegs))
         return std::nullopt;
-    return MeasureMotion(MotionOf(conversion, job), profilePath);
+    return MeasureMotion(MotionOf(conversion, job), done.ProfilePath());
 }
 
 } // namespace gw

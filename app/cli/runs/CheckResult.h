@@ -7,6 +7,8 @@
 namespace gw {
 
 class CFileConversion;
+class CShellConversion;
+struct ConversionChoices;
 struct ConversionJob;
 struct ShellOptions;
 
@@ -23,9 +25,12 @@ ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob&
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,
                                                 const std::string& profilePath);
 
-/// Converts the job's source again with the default conversion, without messages, and measures the result.
-/// Returns no value if that fails, or if the options already select the default conversion.
-std::optional<MeasuredConversion> MeasurePlainRules(const ShellOptions& options, const ConversionJob& job,
-                                                    const std::string& profilePath);
+/// Returns the choices that the options make.
+ConversionChoices ChoicesOf(const ShellOptions& options);
+
+/// Converts the job's source again, with other choices and without messages, and measures the result; nothing
+/// is saved. Returns no value if that fails.
+std::optional<MeasuredConversion> MeasureAnew(const ShellOptions& options, const ConversionChoices& choices,
+                                              const ConversionJob& job, const CShellConversion& done);
 
 } // namespace gw

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// Lists the conversions of a command line with many files: all files that the open dialog would show, each
+/// Lists the conversions of a command line with many files: all motion files in the folders, each
 /// converted to a Kinetra file below the output folder, or next to its source if there is none. If they
 /// cannot be listed, if two would write the same file, or if there are none, prints an error and returns its
 /// code.

@@ -3,26 +3,22 @@
 
 #include "ConvertFile.h"
 
-#include "CJsonWriter.h"
+#include "BetterOptions.h"
+#include "CContentHash.h"
+#include "CDraftShelf.h"
 #include "CNode.h"
 #include "CPagePart.h"
 #include "CShellConversion.h"
 #include "CShellNotices.h"
 #include "CheckResult.h"
-#include "CheckText.h"
-#include "DoubtWords.h"
-#include "NoticeJson.h"
+#include "ConversionAccount.h"
 #include "Output.h"
 #include "Paths.h"
-#include "ProfileChoice.h"
-#include "ProfileFit.h"
 #include "ResultSize.h"
-#include "Text.h"
 #include "Words.h"
 
 #include <algorithm>
 #include <array>
-#include <cstdio>
 #include <optional>
 
 namespace gw {
@@ -30,20 +26,6 @@ namespace gw {
 namespace {
 
 constexpr const char* kOutcomeNames[] = {"converted", "planned", "skipped", "failed"};
-
-/// The facts that are reported about a conversion.
-struct Account
-{
-    EConversion outcome = EConversion::Failed;
-    std::string profile;
-    std::string profilePath;
-    int frames = 0;
-    std::optional<CProfileFit> misfit;
-    std::optional<MeasuredConversion> check;
-    std::optional<MeasuredConversion> plainCheck; // for the same motion without options
-    std::optional<ProfileChoice> chosen; ///< no value if the profile was named or is an original stock one
-    const char* whySkipped = "the output exists";
-};
 
 // Keeps a motion reachable until exit instead of freeing it: the system frees a whole process faster, and
 // deleting object by object takes three percent of a small conversion. Only for the last work of a process,
@@ -62,11 +44,13 @@ void KeepUntilExit(CNode* root)
 class CJobSteps
 {
 public:
-    CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices, Account& account,
-              CPagePart* part)
-        : options_(options), job_(job), notices_(notices), account_(account), m_pkPart(part),
-          m_kConversion(options, {options.align, options.faithful, !options.noHands}, notices)
+    CJobSteps(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices,
+              ConversionAccount& account, const ConversionTools& tools)
+        : options_(options), job_(job), notices_(notices), account_(account), tools_(tools),
+          m_kConversion(options, ChoicesOf(options), notices)
     {
+        if (tools.drafts)
+            m_kConversion.UseDrafts(*tools.drafts);
     }
 
     /// For a process's only conversion.
@@ -106,16 +90,17 @@ private:
     // A later run with --resume may write a report, so measure for it.
     bool IsMeasured() const
     {
-        return options_.check || m_pkPart || !options_.report.empty() || options_.resume;
+        return options_.check || tools_.part || !options_.report.empty() || options_.resume;
     }
     void Check();
+    void CheckOtherOptions();
     bool MayFit();
 
     const ShellOptions& options_;
     const ConversionJob& job_;
     CShellNotices& notices_;
-    Account& account_;
-    CPagePart* m_pkPart; // null if no page was requested
+    ConversionAccount& account_;
+    const ConversionTools& tools_;
     CShellConversion m_kConversion;
 };
 
@@ -125,7 +110,14 @@ bool CJobSteps::SelectProfile()
     account_.misfit = m_kConversion.Nearest();
     account_.profile = m_kConversion.Profile().name;
     account_.chosen = m_kConversion.Chosen();
-    account_.profilePath = m_kConversion.ProfilePath();
+    account_.drafted = m_kConversion.IsDrafted();
+    account_.mended = m_kConversion.Mended().Words();
+    if (!account_.drafted || tools_.drafts->IsKept())
+        account_.profilePath = m_kConversion.ProfilePath();
+    if (account_.drafted && tools_.drafts->IsKept())
+        account_.draftDigits = FileDigits(account_.profilePath);
+    if (tools_.drafts)
+        tools_.drafts->SettleCurrent(); // later sources need not wait any longer
     return selected;
 }
 
@@ -157,20 +149,34 @@ bool CJobSteps::Convert()
 void CJobSteps::Check()
 {
     ConvertedMotion motion = MotionOf(m_kConversion, job_);
-    account_.check = MeasureMotion(motion, account_.profilePath);
+    account_.check = MeasureMotion(motion, m_kConversion.ProfilePath());
     if (!account_.check)
         return;
-    if (options_.check || m_pkPart)
-        account_.plainCheck = MeasurePlainRules(options_, job_, account_.profilePath);
+    if (options_.check || tools_.part)
+        CheckOtherOptions();
     motion.profile = account_.profile;
     motion.measured = &*account_.check;
     motion.plain = account_.plainCheck ? &*account_.plainCheck : nullptr;
-    if (m_pkPart)
-        m_pkPart->Show(motion);
+    if (account_.betterCheck)
+        motion.advice = BetterWords(*account_.check, *account_.betterCheck);
+    if (tools_.part)
+        tools_.part->Show(motion);
+}
+
+// Measures what the default conversion gave, or what more options would give.
+void CJobSteps::CheckOtherOptions()
+{
+    if (options_.align || options_.faithful)
+        account_.plainCheck = MeasureAnew(options_, {}, job_, m_kConversion);
+    if (!MayBeBetter(options_, *account_.check))
+        return;
+    account_.betterCheck = MeasureAnew(options_, {true, true, !options_.noHands}, job_, m_kConversion);
+    if (account_.betterCheck && !IsBetter(*account_.check, *account_.betterCheck))
+        account_.betterCheck.reset();
 }
 
 EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices,
-                   Account& account, CPagePart* part, EProcess process)
+                   ConversionAccount& account, const ConversionTools& tools)
 {
     if (options.skipExisting && IsTaken(job.output))
         return EConversion::Skipped;
@@ -180,94 +186,11 @@ EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShell
         notices.Add(*refusal);
         return EConversion::Failed;
     }
-    CJobSteps steps(options, job, notices, account, part);
+    CJobSteps steps(options, job, notices, account, tools);
     const EConversion outcome = steps.Run();
-    if (process == EProcess::Ends)
+    if (tools.process == EProcess::Ends)
         steps.KeepMotionsUntilExit();
     return outcome;
-}
-
-void PrintChecks(const Account& account)
-{
-    if (account.check)
-        PrintCheck(*account.check, "check");
-    if (account.plainCheck)
-        PrintCheck(*account.plainCheck, "default conversion");
-}
-
-void WriteChecks(CJsonWriter& json, const Account& account)
-{
-    if (!account.check)
-        return;
-    json.Key("check").BeginObject();
-    WriteCheck(json, *account.check);
-    json.EndObject();
-    if (!account.plainCheck)
-        return;
-    json.Key("plainCheck").BeginObject();
-    WriteCheck(json, *account.plainCheck);
-    json.EndObject();
-}
-
-// Adds the confidence after the name of a profile that was chosen automatically.
-std::string ProfileWords(const Account& account)
-{
-    const std::string name = Quoted(account.profile);
-    return account.chosen ? name + ", " + SurenessName(account.chosen->verdict.sureness) : name;
-}
-
-void Print(const ConversionJob& job, const Account& account)
-{
-    const std::string paths = Printable(job.source) + " -> " + Printable(job.output);
-    if (account.outcome == EConversion::Skipped)
-        std::printf("%s: skipped, %s\n", paths.c_str(), account.whySkipped);
-    else if (account.outcome == EConversion::Planned)
-        std::printf("%s: would be converted by profile %s\n", paths.c_str(), ProfileWords(account).c_str());
-    else if (account.outcome == EConversion::Converted)
-        std::printf("%s: %d frames by profile %s\n", paths.c_str(), account.frames,
-                    ProfileWords(account).c_str());
-}
-
-void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob& job, const Account& account,
-               const CShellNotices& notices)
-{
-    CJsonWriter json(file);
-    json.BeginObject();
-    json.Key("source").Text(job.source);
-    json.Key("output").Text(job.output);
-    json.Key("outcome").Text(OutcomeName(account.outcome));
-    json.Key("profile").Text(account.profile);
-    json.Key("profilePath").Text(account.profilePath);
-    json.Key("frames").Integer(account.frames);
-    if (account.chosen)
-        WriteVerdict(json, account.chosen->verdict);
-    WriteNotices(json, notices.All());
-    if (account.misfit)
-    {
-        json.Key("fit").BeginObject();
-        WriteFit(json, *account.misfit);
-        json.EndObject();
-    }
-    if (account.check && file != stdout)
-        WriteKeyFigures(json, *account.check);
-    if (options.check)
-        WriteChecks(json, account);
-    json.EndObject();
-    json.EndDocument();
-}
-
-void Tell(const ShellOptions& options, const ConversionJob& job, const Account& account,
-          const CShellNotices& notices, std::FILE* record)
-{
-    if (record)
-        WriteJson(record, options, job, account, notices);
-    if (options.json)
-        WriteJson(stdout, options, job, account, notices);
-    if (options.json || options.quiet)
-        return;
-    Print(job, account);
-    if (options.check)
-        PrintChecks(account);
 }
 
 } // namespace
@@ -277,30 +200,29 @@ const char* OutcomeName(EConversion outcome)
     return kOutcomeNames[static_cast<size_t>(outcome)];
 }
 
-EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
-                        CPagePart* part, EProcess process)
+EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools)
 {
-    CShellNotices notices(options);
-    Account account;
-    account.outcome = Decide(options, job, notices, account, part, process);
-    Tell(options, job, account, notices, record);
+    CShellNotices notices(options, tools.voice);
+    ConversionAccount account;
+    account.outcome = Decide(options, job, notices, account, tools);
+    TellAccount(options, job, account, notices, tools.record);
     return account.outcome;
 }
 
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
-                std::FILE* record)
+                const ConversionTools& tools)
 {
-    CShellNotices notices(options);
+    CShellNotices notices(options, tools.voice);
     notices.Add(reason);
-    Tell(options, job, {}, notices, record);
+    TellAccount(options, job, {}, notices, tools.record);
 }
 
-void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why)
+void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why, EVoice voice)
 {
-    Account account;
+    ConversionAccount account;
     account.outcome = EConversion::Skipped;
     account.whySkipped = why;
-    Tell(options, job, account, CShellNotices(options), nullptr);
+    TellAccount(options, job, account, CShellNotices(options, voice), nullptr);
 }
 
 } // namespace gw

@@ -9,6 +9,7 @@
 
 namespace gw {
 
+class CDraftShelf;
 class CPagePart;
 struct Notice;
 
@@ -37,17 +38,32 @@ enum class EProcess : uint8_t
     Ends, ///< ends, so its motions need not be freed
 };
 
+/// What a conversion prints of its result and its messages. JSON is printed in any case.
+enum class EVoice : uint8_t
+{
+    Speaks,
+    Failures, ///< only failures
+    Silent,   ///< nothing; the summary of the run says what is needed
+};
+
+/// What a conversion uses besides its source. Null pointers are allowed.
+struct ConversionTools
+{
+    std::FILE* record = nullptr; ///< receives the --json output and the key figures
+    CPagePart* part = nullptr;   ///< receives the conversion's pictures and figures
+    CDraftShelf* drafts = nullptr;
+    EVoice voice = EVoice::Speaks;
+    EProcess process = EProcess::GoesOn;
+};
+
 /// Runs one conversion like the desktop program: open, choose a profile, convert, save. Prints the result to
-/// standard output and everything else to standard error. Keeps no state for the next source. `record`,
-/// unless null, receives the --json output and the key figures; `part`, unless null, receives the
-/// conversion's pictures and figures.
-EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, std::FILE* record,
-                        CPagePart* part, EProcess process = EProcess::GoesOn);
+/// standard output and everything else to standard error. Keeps no state for the next source.
+EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools);
 
 /// Reports, in the same format, a conversion that failed for a reason it could not report itself.
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
-                std::FILE* record);
+                const ConversionTools& tools);
 /// Reports, in the same format, a skipped conversion.
-void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why);
+void TellSkipped(const ShellOptions& options, const ConversionJob& job, const char* why, EVoice voice);
 
 } // namespace gw

@@ -6,6 +6,7 @@
 #include "CPrivateFile.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -17,8 +18,8 @@ namespace {
 
 bool SayNoTemporary(const std::string& folder)
 {
-    SayError(Printable(folder) + ": a temporary file cannot be written here (check the free space and the "
-                                 "permissions, or set TMPDIR to another folder)");
+    SayError(Printable(folder) + ": a temporary file cannot be written here" + TakeSystemErrorWords() +
+             " (TMPDIR can name another folder)");
     return false;
 }
 

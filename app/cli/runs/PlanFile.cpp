@@ -1,6 +1,7 @@
 #include "PlanFile.h"
 
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -21,7 +22,7 @@ std::string PlanWords(const std::string& path, const Finding& failure)
     case EFailure::UnexpectedLine:
         return place + ": this line is not a valid plan entry; create the plan again";
     default:
-        return path + ": the plan cannot be read (check the path and the permissions)";
+        return path + ": the plan cannot be read" + SystemErrorWords(failure.systemError);
     }
 }
 

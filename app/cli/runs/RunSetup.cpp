@@ -2,6 +2,7 @@
 
 #include "Output.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -51,7 +52,7 @@ bool MakeOutputFolder(const ShellOptions& options)
 {
     if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
         return true;
-    SayError(Printable(options.outputFolder) + ": the folder cannot be created");
+    SayError(Printable(options.outputFolder) + ": the folder cannot be created" + TakeSystemErrorWords());
     return false;
 }
 

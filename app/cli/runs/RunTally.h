@@ -5,8 +5,11 @@
 
 #include <array>
 #include <cstddef>
+#include <string>
 
 namespace gw {
+
+class CJsonWriter;
 
 /// The number of sources for each outcome.
 struct RunTally
@@ -18,7 +21,9 @@ struct RunTally
     size_t operator[](EConversion outcome) const { return ended[static_cast<size_t>(outcome)]; }
 };
 
-/// Prints the summary of a run: one line, or one object with --json.
-void TellTally(const ShellOptions& options, const RunTally& tally);
+/// Returns "8 converted, 2 skipped, 0 failed, 0 left".
+std::string TallyWords(const ShellOptions& options, const RunTally& tally);
+/// Writes the same as members of an open JSON object.
+void WriteTally(CJsonWriter& json, const RunTally& tally);
 
 } // namespace gw

@@ -6,6 +6,7 @@
 #include "CMappedFile.h"
 #include "Paths.h"
 #include "SourceTree.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -52,7 +53,7 @@ bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
     const bool isInput = options.filesFrom == "-";
     if (!isInput && file.Open(options.filesFrom) != EFailure::None)
     {
-        SayError(Printable(options.filesFrom) + ": the list cannot be read");
+        SayError(Printable(options.filesFrom) + ": the list cannot be read" + TakeSystemErrorWords());
         return false;
     }
     const std::string input = isInput ? ReadStandardInput() : std::string();
@@ -67,13 +68,16 @@ bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
     return true;
 }
 
-// A folder that cannot be read is listed in place of its sources; converting it then fails with a message.
+// A folder that cannot be read is listed in place of its sources, and so is a dead link; converting it then
+// fails with a message.
 void AddFolder(const std::string& folder, const std::string& below, const ShellOptions& options,
                std::span<const std::string_view> extensions, std::vector<RunSource>& sources)
 {
     const SourceFolder tree = WalkFolder(folder, extensions, options.outputFolder);
     for (const std::string& file : tree.files)
         sources.push_back({WithSeparator(folder) + file, below + file});
+    for (const std::string& link : tree.deadLinks)
+        sources.push_back({WithSeparator(folder) + link, below + link});
     for (const std::string& unreadable : tree.unreadable)
         sources.push_back({unreadable, below + Joined(Steps(unreadable.substr(folder.size()))) + "folder"});
 }

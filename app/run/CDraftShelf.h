@@ -1,0 +1,57 @@
+#pragma once
+
+#include <atomic>
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+/// Drafted profiles, one per skeleton, shared by the workers of a run. The first source of a skeleton, in the
+/// order of the run, gets a draft; all later ones use it, no matter which worker is faster. The drafts are
+/// files in a folder. Drafts of earlier runs in the same folder are used too.
+///
+/// A skeleton is named by its digits, which end its file's name: "walk.0123456789ab.prf".
+class CDraftShelf
+{
+public:
+    /// Keeps the drafts in a folder, which is created with the first one. An empty folder means a temporary
+    /// one, which is deleted with the object. `jobCount` is the number of sources.
+    CDraftShelf(std::string folder, size_t jobCount);
+    ~CDraftShelf();
+    CDraftShelf(const CDraftShelf&) = delete;
+    CDraftShelf& operator=(const CDraftShelf&) = delete;
+
+    /// Returns whether the drafts outlive the object.
+    bool IsKept() const { return !m_bTemporary; }
+
+    /// Starts a job in this process.
+    void Begin(size_t job) { m_uiJob = job; }
+    /// Declares that a job needs no draft, has one, or has ended. Until a job is settled or has asked for a
+    /// draft of another skeleton, later jobs that need one wait for it. Can be called in any process.
+    void Settle(size_t job);
+    void SettleCurrent() { Settle(m_uiJob); }
+    /// Returns the draft for the current job's skeleton; waits until no earlier job can provide it. Empty if
+    /// there is none: then the job must draft it, and keep the draft or settle.
+    std::string Find(std::string_view skeleton);
+    /// Writes a draft, settles the current job, and returns the draft's path. `stem` begins the file's name.
+    /// If it cannot be written, returns an empty path; see TakeSystemError.
+    std::string Keep(std::string_view skeleton, std::string_view stem, std::string_view text);
+
+private:
+    using State = std::atomic<uint64_t>;
+
+    void WaitForEarlier(uint64_t asked);
+    std::string FindFile(std::string_view skeleton) const;
+    bool OpenFolder();
+
+    std::string m_kFolder;
+    bool m_bTemporary;
+    int m_iOwner; ///< the process that created a temporary folder
+    size_t m_uiJobCount;
+    size_t m_uiJob = 0;
+    State* m_pkStates = nullptr; ///< one per job, in memory that all workers share; null if there is none
+};
+
+} // namespace gw
