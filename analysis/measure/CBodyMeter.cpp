@@ -1,9 +1,11 @@
 #include "CBodyMeter.h"
 
 #include "CNode.h"
+#include "DetailCurves.h"
 #include "Figures.h"
 #include "FindPlants.h"
 #include "HostBones.h"
+#include "Landmarks.h"
 #include "LegJitter.h"
 #include "MeasureFoot.h"
 #include "MeasureHands.h"
@@ -21,13 +23,6 @@ namespace {
 
 constexpr double kLeastTravel = 500.0; // mm; a shorter path is only sway and noise
 constexpr double kSinkShare = 0.05;    // deeper values in fewer frames than this are outliers
-
-std::vector<LegJoints> LegsOf(const std::vector<LegPair>& pairs, LegJoints LegPair::*side)
-{
-    std::vector<LegJoints> legs;
-    std::ranges::transform(pairs, std::back_inserter(legs), side);
-    return legs;
-}
 
 // A bad mapping can use a knee as its own ankle.
 bool IsLength(double leg)
@@ -67,17 +62,6 @@ std::optional<double> CommonF1(const std::vector<FootMeasures>& feet)
     return RatioOf(2.0 * static_cast<double>(both), static_cast<double>(standing));
 }
 
-// Returns one number of a leg's postures for each frame: (number - floor) x scale.
-std::vector<float> Curve(const CLegTrack& leg, float CLegTrack::Posture::*number, double floor = 0.0,
-                         double scale = 1.0)
-{
-    std::vector<float> curve;
-    curve.reserve(leg.Postures().size());
-    for (const CLegTrack::Posture& posture : leg.Postures())
-        curve.push_back(static_cast<float>((static_cast<double>(posture.*number) - floor) * scale));
-    return curve;
-}
-
 // If the ankle is closer to its floor than this share of the leg length, the skeleton has no sole.
 constexpr double kNoSole = 0.01;
 
@@ -99,28 +83,6 @@ double SoleFloor(const std::vector<CLegTrack>& legs)
     return static_cast<double>(Percentile(std::move(heights), kFloorShare));
 }
 
-// Returns the joint of a named target bone on one side; null if it is not mapped.
-CNode* Landmark(std::span<const BonePair> pairs, std::string_view target, CNode* BonePair::*side)
-{
-    const auto pair =
-        std::ranges::find_if(pairs, [=](const BonePair& of) { return of.target->NameView() == target; });
-    return pair == pairs.end() ? nullptr : (*pair).*side;
-}
-
-BodyLandmarks LandmarksOf(std::span<const BonePair> pairs, std::vector<LegJoints> legs,
-                          CNode* BonePair::*side)
-{
-    BodyLandmarks joints;
-    joints.legs = std::move(legs);
-    joints.neck = Landmark(pairs, kNeckBone, side);
-    joints.head = Landmark(pairs, kHeadBone, side);
-    if (!joints.neck)
-        joints.neck = std::exchange(joints.head, nullptr);
-    for (size_t i = 0; i < joints.hands.size(); ++i)
-        joints.hands[i] = Landmark(pairs, kHostSides[i].hand, side);
-    return joints;
-}
-
 double PathOf(const CBodyTrack& body)
 {
     CRunningMean steps;
@@ -129,25 +91,13 @@ double PathOf(const CBodyTrack& body)
     return steps.Sum();
 }
 
-// Returns the hips' positions: x and z relative to the first frame, y above the floor.
-std::vector<Vec3> HipsFromStart(const CBodyTrack& body, double floor)
-{
-    std::vector<Vec3> places;
-    for (size_t f = 0; f < body.FrameCount(); ++f)
-    {
-        const Vec3 start = body.Hips(0);
-        places.push_back(body.Hips(f) - Vec3{start.x, static_cast<float>(floor), start.z});
-    }
-    return places;
-}
-
 } // namespace
 
 CBodyMeter::CBodyMeter(std::span<const BonePair> pairs, const CSourceTable& sources)
     : m_kLegs(FindLegs(pairs, sources)), m_kSourceFeet(LegsOf(m_kLegs, &LegPair::source)),
       m_kResultFeet(LegsOf(m_kLegs, &LegPair::result)),
-      m_kSource(LandmarksOf(pairs, LegsOf(m_kLegs, &LegPair::source), &BonePair::source)),
-      m_kResult(LandmarksOf(pairs, LegsOf(m_kLegs, &LegPair::result), &BonePair::target))
+      m_kSource(LandmarksOf(pairs, m_kLegs, &LegPair::source, &BonePair::source)),
+      m_kResult(LandmarksOf(pairs, m_kLegs, &LegPair::result, &BonePair::target))
 {
     for (size_t i = 0; i < m_kHands.size(); ++i)
         m_kHands[i] = {Landmark(pairs, kHostSides[i].hand, &BonePair::target),
@@ -276,10 +226,11 @@ void CBodyMeter::WriteFeetDetail(ConversionDetail& detail, const LegPlants& sour
     {
         const CLegTrack& from = m_kSourceFeet.Legs()[i];
         const CLegTrack& to = m_kResultFeet.Legs()[i];
-        detail.feet.push_back({Curve(from, &CLegTrack::Posture::soleHeight, soleFloor, SourceScale()),
-                               Curve(to, &CLegTrack::Posture::soleHeight),
-                               Curve(from, &CLegTrack::Posture::kneeAngle),
-                               Curve(to, &CLegTrack::Posture::kneeAngle), source[i].foot, result[i].foot});
+        detail.feet.push_back({PostureCurve(from, &CLegTrack::Posture::soleHeight, soleFloor, SourceScale()),
+                               PostureCurve(to, &CLegTrack::Posture::soleHeight),
+                               PostureCurve(from, &CLegTrack::Posture::kneeAngle),
+                               PostureCurve(to, &CLegTrack::Posture::kneeAngle), source[i].foot,
+                               result[i].foot});
     }
 }
 

@@ -86,8 +86,8 @@ struct FootMeasures
     /// Held sole: the distance of the lower end of the result's sole from the floor, y = 0, above or below,
     /// over the frames in contact in the source, in mm. The sole is the points on the floor under ankle and
     /// toe in the rest pose (RestFloor).
-    double heldSole = 0.0; ///< 95th percentile
-    double heldSoleLargest = 0.0;
+    std::optional<double> heldSole; ///< 95th percentile; missing if the source's foot never stands
+    std::optional<double> heldSoleLargest;
     int heldSoleFrame = 0; ///< frame of the largest distance
 
     /// Knee: the angle between thigh and calf, 0 for a straight leg. A pop is a run of frames in which this

@@ -165,13 +165,14 @@ void MeasureHeldSoles(const FootSide& source, const FootSide& result, MeasuredFo
             const float height = result.track.Postures()[static_cast<size_t>(f)].soleHeight;
             const double away = std::fabs(static_cast<double>(height)) * result.scale;
             foot.heldSoles.push_back(static_cast<float>(away));
-            if (!std::isfinite(away) || away <= foot.figures.heldSoleLargest)
+            if (!std::isfinite(away) || away <= foot.figures.heldSoleLargest.value_or(-1.0))
                 continue;
             foot.figures.heldSoleLargest = away;
             foot.figures.heldSoleFrame = f;
         }
     }
-    foot.figures.heldSole = static_cast<double>(Percentile(foot.heldSoles, kMostShare));
+    if (!foot.heldSoles.empty())
+        foot.figures.heldSole = static_cast<double>(Percentile(foot.heldSoles, kMostShare));
 }
 
 std::vector<float> KneeAngles(const CLegTrack& track)

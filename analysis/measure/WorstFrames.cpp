@@ -99,7 +99,7 @@ void AddFeet(const std::vector<FootMeasures>& feet, std::vector<WorstFrame>& wor
         add(EFrameFault::KneePop, foot.kneePopFrame, foot.kneePopLargest);
         add(EFrameFault::AnkleSlide, foot.ankleSlide.largestFrame, foot.ankleSlide.largest);
         add(EFrameFault::ToeSlide, foot.toeSlide.largestFrame, foot.toeSlide.largest);
-        add(EFrameFault::HeldSole, foot.heldSoleFrame, foot.heldSoleLargest);
+        add(EFrameFault::HeldSole, foot.heldSoleFrame, foot.heldSoleLargest.value_or(0.0));
     }
 }
 

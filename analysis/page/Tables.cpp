@@ -115,6 +115,27 @@ void F1(CMarkup& page, const FootMeasures& foot)
         page.Raw("none");
 }
 
+void HeldSole(CMarkup& page, const FootMeasures& foot)
+{
+    page.Number(foot.heldSole.value_or(0.0), 2);
+}
+
+void LargestHeldSole(CMarkup& page, const FootMeasures& foot)
+{
+    page.Number(foot.heldSoleLargest.value_or(0.0), 2).Raw(" <small>frame ");
+    page.Integer(foot.heldSoleFrame).Raw("</small>");
+}
+
+// For a foot that never stands in the source, figures of standing feet are "none".
+template <void (*append)(CMarkup&, const FootMeasures&)>
+void Standing(CMarkup& page, const FootMeasures& foot)
+{
+    if (foot.sourceContacts > 0)
+        append(page, foot);
+    else
+        page.Raw("none");
+}
+
 void Plants(CMarkup& page, const SlideMeasures& slide)
 {
     page.Integer(static_cast<long long>(slide.plants));
@@ -159,13 +180,13 @@ constexpr RecordRow<FootMeasures> kFootRows[] = {
     FootRow("toe plants", Slides<&Foot::toeSlide, Plants>),
     FootRow("added toe slide, median mm", Slides<&Foot::toeSlide, MedianSlide>),
     FootRow("added toe slide, worst mm", Slides<&Foot::toeSlide, LargestSlide>),
-    FootRow("held sole, 95 % mm", One<&Foot::heldSole, 2>),
-    FootRow("held sole, worst mm", AtFrame<&Foot::heldSoleLargest, &Foot::heldSoleFrame, 2>),
+    FootRow("held sole, 95 % mm", Standing<HeldSole>),
+    FootRow("held sole, worst mm", Standing<LargestHeldSole>),
     FootRow("turn, mean °", One<&Foot::turnError, 2>),
-    FootRow("turn while planted, mean °", One<&Foot::turnWhileStanding, 2>),
+    FootRow("turn while planted, mean °", Standing<One<&Foot::turnWhileStanding, 2>>),
     FootRow("turn, most °", One<&Foot::turnLargest, 2>),
-    FootRow("sole tilt, mean °", Both<&Foot::soleTiltMean, &Foot::sourceSoleTiltMean, 2>),
-    FootRow("sole tilt, max °", One<&Foot::soleTiltLargest, 2>),
+    FootRow("sole tilt, mean °", Standing<Both<&Foot::soleTiltMean, &Foot::sourceSoleTiltMean, 2>>),
+    FootRow("sole tilt, max °", Standing<One<&Foot::soleTiltLargest, 2>>),
     FootRow("knee pops", One<&Foot::kneePops, 0>),
     FootRow("knee pop beyond the source, max °", AtFrame<&Foot::kneePopLargest, &Foot::kneePopFrame, 2>),
 };

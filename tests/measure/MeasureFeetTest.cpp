@@ -167,6 +167,12 @@ TEST(MeasureFeet, SoleStandsAndSinksByItsDepth)
     ExpectMeasured(tilted.feet[0].soleTiltMean, 5.0);
     ExpectMeasured(tilted.feet[0].soleTiltLargest, 5.0);
     ExpectMeasured(tilted.feet[0].sourceSoleTiltMean, 0.0);
+
+    const auto still = [](CMadeFigure&, int) {};
+    const ConversionMeasures pose = PairedFigures().Measure(still, still, 1);
+    ASSERT_EQ(pose.feet.size(), 2u);
+    EXPECT_FALSE(pose.heldSole || pose.feet[0].heldSole || pose.feet[0].heldSoleLargest)
+        << "too short for a contact";
 }
 
 TEST(MeasureFeet, TurnIsTheAngleBetweenHeadings)

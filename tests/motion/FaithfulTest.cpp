@@ -138,7 +138,7 @@ TEST_F(Faithful, KneesBendInTheSourcesPlaneAndFeetKeepTheirTurn)
         {
             ExpectLeg(side, 4.0, 6.0);
             const Mat3 turned = halfTurn * NormalizedRows(m_kWalker.Bone(side + "Ankle").m_kWorldMatrix);
-            EXPECT_LT(DegreesBetween(NormalizedRows(Target(side + "Foot").m_kWorldMatrix), turned), 0.05);
+            EXPECT_LT(DegreesBetween(NormalizedRows(Target(side + "Foot").m_kWorldMatrix), turned), 1.2);
         }
     }
 }
@@ -158,7 +158,7 @@ TEST_F(Faithful, StandingFeetOfABodyThatRisesStayOnTheFloorAndItsKneesAsTheyAre)
         SCOPED_TRACE(frame);
         PoseAt(frame);
         ExpectLeg("L", 1.5, 1.5);
-        EXPECT_NEAR(Place("LFoot").y, 80.0f, 1.0f);
+        EXPECT_NEAR(Place("LFoot").y, 80.0f, 2.0f);
     }
 }
 

@@ -135,6 +135,24 @@ TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
     }
 }
 
+// The wanted place is 60 mm above the thigh, 250 mm ahead of the hip, but the arm ends before it.
+TEST(CHandPlan, HandOutOfReachGoesToAnotherPlaceOnTheThigh)
+{
+    TouchPoints source = Sitting();
+    source.hands[0] = {95.0f, 510.0f, 250.0f};
+    TouchPoints target = source;
+    target.hands[0] = {95.0f, 590.0f, 250.0f};
+    target.shoulders[0] = {95.0f, 1000.0f, 0.0f};
+    target.reach[0] = 510.0;
+    CHandPlan plan(40, 1.0 / 30.0, true);
+    for (size_t frame = 0; frame < 40; ++frame)
+        plan.Add(frame, source, target);
+    plan.Solve();
+    const Vec3 hand = target.hands[0] + plan.Way(0, 20);
+    EXPECT_NEAR(hand.y - 450.0f, 60.0f, 10.0f);
+    EXPECT_NEAR(Vec3Length(hand - target.shoulders[0]), 510.0, 5.0);
+}
+
 TEST(CFaithfulArm, HandGoesItsWayAndTheElbowStaysOnItsSide)
 {
     const Ref<CNode> source = Standing(MakeTarget());

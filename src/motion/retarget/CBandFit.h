@@ -39,8 +39,4 @@ private:
 /// smoothed out above it.
 double BendWeight(double hertz, double secondsPerFrame);
 
-/// The cutoff, in Hz, with which feet and hands return to their free paths after a release: they are back
-/// after 0.2 s.
-inline constexpr double kReturnHertz = 2.0;
-
 } // namespace gw

@@ -17,6 +17,8 @@ namespace {
 // How much the elbow's usual side counts, in millimeters. It decides for a straight arm; the elbow of a bent
 // one is ten times farther from the line.
 constexpr float kUsualSide = 5.0f;
+// A straighter arm yields little, so a hand does not get where it should with one.
+constexpr double kComfortable = 0.95;
 
 Vec3 PlaceOfBone(const CPoseMatcher& matcher, size_t bone)
 {
@@ -50,6 +52,16 @@ std::optional<CFaithfulArm> CFaithfulArm::Plan(const CRetargeter& retargeter, co
     arm.m_kLengths = {Vec3Length(forearm->m_kMatrix.Translation()),
                       Vec3Length(hand->m_kMatrix.Translation())};
     return arm;
+}
+
+Vec3 CFaithfulArm::Shoulder(const CPoseMatcher& matcher) const
+{
+    return PlaceOfBone(matcher, m_kPath[m_kPath.size() - 3]);
+}
+
+double CFaithfulArm::Reach() const
+{
+    return kComfortable * (m_kLengths.upper + m_kLengths.lower);
 }
 
 // Returns the elbow's offset from the line between shoulder and hand.

@@ -24,6 +24,10 @@ public:
     /// Returns the indices of the target's bones from the root down to the hand.
     const std::vector<size_t>& Path() const { return m_kPath; }
     /// Returns the index of the target's hand bone.
+    /// Returns the position of the upper arm's joint in the matcher's current pose.
+    Vec3 Shoulder(const CPoseMatcher& matcher) const;
+    /// Returns how far from its shoulder a hand can easily be moved.
+    double Reach() const;
     size_t Hand() const { return m_kPath.back(); }
     /// Records the elbow's side in the matcher's current pose. A straight arm later bends to the usual side.
     void ReadPose(const CPoseMatcher& matcher);

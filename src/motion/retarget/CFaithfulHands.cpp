@@ -7,6 +7,7 @@
 #include "Skeleton.h"
 
 #include <algorithm>
+#include <limits>
 
 namespace gw {
 
@@ -20,13 +21,13 @@ TouchPoints PointsOf(const Vec3* places)
 {
     const Vec3& neck = places[6];
     const Vec3& head = places[7];
-    return {
-        {places[0], places[1]},
-        {places[2], places[3]},
-        {places[4], places[5]},
-        neck,
-        head + Vec3Normalized(head - neck) * kHeadMiddle
-    };
+    TouchPoints points;
+    points.hands = {places[0], places[1]};
+    points.hips = {places[2], places[3]};
+    points.knees = {places[4], places[5]};
+    points.neck = neck;
+    points.head = head + Vec3Normalized(head - neck) * kHeadMiddle;
+    return points;
 }
 
 } // namespace
@@ -90,6 +91,14 @@ void CFaithfulHands::Append()
         m_kPlaces.push_back(PlaceOf(*joint));
 }
 
+float CFaithfulHands::LowestHand() const
+{
+    float lowest = std::numeric_limits<float>::infinity();
+    for (size_t first = 0; first + kJoints <= m_kPlaces.size(); first += kJoints)
+        lowest = std::min({lowest, m_kPlaces[first].y, m_kPlaces[first + 1].y});
+    return lowest;
+}
+
 TouchPoints CFaithfulHands::SourceAt(size_t frame, const std::function<Vec3(const Vec3&)>& onTarget) const
 {
     Vec3 places[kJoints];
@@ -118,7 +127,13 @@ TouchPoints CFaithfulHands::TargetPoints() const
     Vec3 places[kJoints];
     std::ranges::transform(m_kJoints, places,
                            [&](size_t bone) { return matcher_.Bones()[bone].world.Translation(); });
-    return PointsOf(places);
+    TouchPoints points = PointsOf(places);
+    for (size_t side = 0; side < m_kArms.size(); ++side)
+    {
+        points.shoulders[side] = m_kArms[side].Shoulder(matcher_);
+        points.reach[side] = m_kArms[side].Reach();
+    }
+    return points;
 }
 
 void CFaithfulHands::Plan(const std::vector<CKeyframeControl*>& tracks,

@@ -25,6 +25,8 @@ public:
     std::vector<CNode*> Joints() const;
     /// Adds the source's current pose as the next frame.
     void Append();
+    /// Returns the lowest y of the source's hands, in the source's units; infinity without hands.
+    float LowestHand() const;
     /// Finds what the hands touch and where they must go. `onTarget` converts a position of the source to the
     /// target's scale and floor. `tracks` contain the finished motion except for the hands.
     void Plan(const std::vector<CKeyframeControl*>& tracks, const std::function<Vec3(const Vec3&)>& onTarget,

@@ -1,5 +1,6 @@
 #include "CFaithfulLeg.h"
 
+#include "CPoseSampler.h"
 #include "Directions.h"
 #include "JointSteps.h"
 
@@ -70,7 +71,11 @@ CFaithfulLeg::CFaithfulLeg(const CPoseMatcher& matcher, const LegJoints& source,
       m_kPath(PathTo(matcher, target.toe ? *target.toe : *target.ankle))
 {
     if (target.toe)
+    {
         m_fToeSole = static_cast<float>(Vec3Length(SoleUnder(*target.toe, restFloor)));
+        m_kFlatToe =
+            ToePlaceOf(RestWorld(*target.toe).Translation() - RestWorld(*target.ankle).Translation());
+    }
 }
 
 void CFaithfulLeg::AppendSource()
@@ -80,21 +85,24 @@ void CFaithfulLeg::AppendSource()
                          DirectionOr(before.shin, *m_kSource.knee, *m_kSource.ankle)});
 }
 
-void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame)
+void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const ToePlace& moved)
 {
     const auto& bones = matcher.Bones();
     const Mat4& ankle = bones[m_uiFoot].world;
     Frame& at = m_kFrames[frame];
-    float lowest = TransformCoord(m_kHeelSole, ankle).y;
+    Vec3 heel = TransformCoord(m_kHeelSole, ankle) - ankle.Translation();
+    float lowest = heel.y;
     if (m_iToe >= 0)
     {
-        const Vec3 toe = bones[static_cast<size_t>(m_iToe)].world.Translation();
-        lowest = std::min(lowest, toe.y - m_fToeSole);
-        at.toe = toe - ankle.Translation();
+        const Vec3 toe = bones[static_cast<size_t>(m_iToe)].world.Translation() - ankle.Translation();
+        at.pitch = PitchFoot(toe, {m_kFlatToe.ahead + moved.ahead, m_kFlatToe.height + moved.height});
+        at.toe = Turned(toe, at.pitch);
+        heel = Turned(heel, at.pitch);
+        lowest = std::min(heel.y, at.toe.y - m_fToeSole);
     }
     const Mat4& thigh = bones[m_uiThigh].world;
     at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
-    at.sole = ankle.Translation().y - lowest;
+    at.sole = -lowest;
     m_kForward = m_kForward + ToLocal(at.thigh - at.shin, NormalizedRows(thigh));
 }
 

@@ -2,6 +2,7 @@
 
 #include "CLegTrack.h"
 #include "CPoseMatcher.h"
+#include "FootPitch.h"
 #include "YieldKnee.h"
 
 #include <optional>
@@ -17,11 +18,12 @@ public:
     /// One frame of the leg. Directions are in world space, lengths in the target's units.
     struct Frame
     {
-        Vec3 thigh;           ///< unit direction of the source from hip to knee
-        Vec3 shin;            ///< unit direction of the source from knee to ankle
-        Vec3 hip = kVec3Zero; ///< the target's hip joint, relative to its root
-        Vec3 toe = kVec3Zero; ///< the target's toe joint, relative to its ankle; zero without one
-        float sole = 0.0f;    ///< how far the sole's lower end is below the target's ankle
+        Vec3 thigh;                 ///< unit direction of the source from hip to knee
+        Vec3 shin;                  ///< unit direction of the source from knee to ankle
+        Vec3 hip = kVec3Zero;       ///< the target's hip joint, relative to its root
+        Vec3 toe = kVec3Zero;       ///< the target's toe joint, relative to its ankle; zero without one
+        float sole = 0.0f;          ///< how far the sole's lower end is below the target's ankle
+        Mat3 pitch = kMat3Identity; ///< rotation of the target's foot that makes up for its length
     };
 
     /// Plans a leg from the joints of the target, which must be in rest pose with its soles at the height
@@ -35,8 +37,9 @@ public:
     /// Adds the source's current pose as the next frame.
     void AppendSource();
     /// Reads the target's pose of a frame from the matcher's world matrices. The frame must have been
-    /// appended.
-    void ReadTarget(const CPoseMatcher& matcher, size_t frame);
+    /// appended. `moved` is how far the source's toe is, relative to its ankle, from where it is in a foot
+    /// that stands flat, in the target's scale; NaN for a foot without a toe.
+    void ReadTarget(const CPoseMatcher& matcher, size_t frame, const ToePlace& moved);
 
     const Frame& At(size_t frame) const { return m_kFrames[frame]; }
     const LegLengths& Lengths() const { return m_kLengths; }
@@ -66,6 +69,7 @@ private:
     int m_iToe; // -1 for a foot without one
     LegLengths m_kLengths;
     Vec3 m_kHeelSole;        // in the foot's space
+    ToePlace m_kFlatToe{};   // in the rest pose
     float m_fToeSole = 0.0f; // below the toe joint, however it is bent: some sources bend it within one frame
     Vec3 m_kForward = kVec3Zero; // summed over the frames, in the thigh's space
     std::vector<size_t> m_kPath;

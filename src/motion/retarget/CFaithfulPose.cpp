@@ -7,7 +7,9 @@
 #include "PointBone.h"
 #include "Skeleton.h"
 
+#include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace gw {
 
@@ -101,16 +103,31 @@ void CFaithfulPose::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>
     }
 }
 
+// Returns how far the source's toe is, relative to its ankle, from where it is in a foot that stands flat, in
+// the target's scale; NaN for a foot without a toe.
+ToePlace CFaithfulPose::ToeMoved(size_t leg, size_t frame, double flatDrop) const
+{
+    const CLegTrack& track = m_kSource.Leg(leg);
+    const LegLengths& lengths = m_kLegs[leg].Lengths();
+    if (!track.HasToe())
+        return {0.0, std::numeric_limits<double>::quiet_NaN()};
+    const ToePlace place = ToePlaceOf(track.Toes()[frame] - track.Ankles()[frame]);
+    const double square = place.ahead * place.ahead + place.height * place.height - flatDrop * flatDrop;
+    const double scale = (lengths.upper + lengths.lower) / m_kSource.LegLength();
+    return {(place.ahead - std::sqrt(std::max(square, 0.0))) * scale, (place.height + flatDrop) * scale};
+}
+
 void CFaithfulPose::Plan(const std::vector<CKeyframeControl*>& tracks, const Vec3& origin,
                          double secondsPerFrame, bool holdFeet)
 {
+    const auto flatDrop = static_cast<double>(m_kSource.FlatDrop(secondsPerFrame));
     for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
     {
         PoseFrame(frame, tracks);
-        for (CFaithfulLeg& leg : m_kLegs)
-            leg.ReadTarget(matcher_, frame);
+        for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+            m_kLegs[leg].ReadTarget(matcher_, frame, ToeMoved(leg, frame, flatDrop));
     }
-    plan_.emplace(m_kLegs, m_kSource, origin, secondsPerFrame, holdFeet);
+    plan_.emplace(m_kLegs, m_kSource, m_kHands.LowestHand(), origin, secondsPerFrame, holdFeet);
 }
 
 void CFaithfulPose::WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
@@ -157,7 +174,7 @@ void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframe
     const Mat3 pelvis = above < 0 ? kMat3Identity : worldOf(static_cast<size_t>(above));
     const Mat3 thigh = PointedTo(knee, worldOf(leg.Thigh()), bones[leg.Calf()].translation);
     const Mat3 calf = PointedTo(ankle - knee, worldOf(leg.Calf()), bones[leg.Foot()].translation);
-    const Mat3 foot = worldOf(leg.Foot());
+    const Mat3 foot = worldOf(leg.Foot()) * leg.At(frame).pitch;
     tracks[leg.Thigh()]->m_kRotationKeys[frame] = QuatFromMat3(thigh * Mat3Transpose(pelvis));
     tracks[leg.Calf()]->m_kRotationKeys[frame] = QuatFromMat3(calf * Mat3Transpose(thigh));
     tracks[leg.Foot()]->m_kRotationKeys[frame] = QuatFromMat3(foot * Mat3Transpose(calf));

@@ -16,8 +16,8 @@ class CKeyframeControl;
 
 /// Keeps a matched motion closer to the source than matching bone by bone does. The trunk leans like the
 /// source's. The midpoint of the hip joints follows the source's path, scaled by leg length. Thighs and
-/// calves point in the source's directions. Feet keep their rotation, and stand still on y = 0 while the
-/// source's feet stand. Hands touch what the source's hands touch.
+/// calves point in the source's directions. Feet keep their rotation within a few degrees of pitch, and stand
+/// still on y = 0 while the source's feet stand. Hands touch what the source's hands touch.
 ///
 /// This takes three passes over the frames. First, call Append after each frame of the source is matched.
 /// Then call Plan, which needs all frames, and WriteFrame for each frame. Finally, for the hands, call
@@ -50,6 +50,7 @@ public:
 
 private:
     void PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
+    ToePlace ToeMoved(size_t leg, size_t frame, double flatDrop) const;
     Vec3 KneePlace(size_t leg, size_t frame, const Vec3& ankle) const;
     void WriteLeg(size_t leg, size_t frame, const std::vector<CKeyframeControl*>& tracks);
 

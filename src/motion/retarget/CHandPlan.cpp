@@ -25,7 +25,7 @@ namespace {
 // In millimeters of the target. A gap is the distance minus the thickness of the thing.
 constexpr double kTouch = 30.0; // up to this gap, a touch counts in full, apart from kNear
 constexpr double kNear = 50.0;  // the factor for near gaps is 1/2 at this gap, before it is squared
-constexpr double kFade = 30.0;  // over this distance beyond kTouch, a touch fades out
+constexpr double kFade = 20.0;  // over this distance beyond kTouch, a touch fades out
 constexpr double kThigh = 50.0; // thickness: from the middle of a thing to a wrist that lies on it
 constexpr double kTrunk = 60.0;
 constexpr double kHead = 80.0;
@@ -34,9 +34,13 @@ constexpr double kFloor = 40.0;
 constexpr double kOnFloor = 20.0; // the goal of a wrist is never lower
 
 constexpr double kTouchWeight = 60.0; // weight of a hand that touches; its free path has weight 1
+constexpr double kHandHertz = 4.0; // arms swing past a thigh fast: the shift must be gone before the hand is
+
+// Rounds of the search for a goal within reach. Most goals are, and need none.
+constexpr int kReachRounds = 20;
 
 // Weight of the side of a thing on which the source's hand is, against 1 for the side of the free hand.
-constexpr float kSourceSide = 0.5f;
+constexpr float kSourceSide = 0.25f;
 
 struct Segment
 {
@@ -95,6 +99,23 @@ std::array<Thing, 4> ThingsOf(const TouchPoints& source, const TouchPoints& targ
     };
 }
 
+// Returns a hand's goal for one thing that it can reach. A goal out of reach is pulled back to the arm's
+// reach and then to the thing's distance again, alternately, so that it moves along the thing.
+Vec3 GoalAt(const Thing& thing, const TouchPoints& source, const TouchPoints& target, size_t side)
+{
+    Vec3 goal = WantedAt(thing.source, thing.target, source.hands[side], target.hands[side]);
+    for (int round = 0; round < kReachRounds; ++round)
+    {
+        const Vec3 way = goal - target.shoulders[side];
+        const double distance = Vec3Length(way);
+        if (distance <= target.reach[side] || thing.target.from == thing.target.to)
+            break; // nothing can be gained along a point
+        goal = WantedAt(thing.source, thing.target, source.hands[side],
+                        target.shoulders[side] + way * static_cast<float>(target.reach[side] / distance));
+    }
+    return goal;
+}
+
 double Distance(const Segment& segment, const Vec3& point)
 {
     return Vec3Length(point - segment.Nearest(point));
@@ -104,7 +125,7 @@ double Distance(const Segment& segment, const Vec3& point)
 
 CHandPlan::CHandPlan(size_t frameCount, double secondsPerFrame, bool hasFloor) : m_bHasFloor(hasFloor)
 {
-    const CBandFit free(frameCount, BendWeight(kReturnHertz, secondsPerFrame), 1.0);
+    const CBandFit free(frameCount, BendWeight(kHandHertz, secondsPerFrame), 1.0);
     m_kFits.assign(2, {free, free, free});
 }
 
@@ -139,8 +160,11 @@ void CHandPlan::Add(size_t frame, const TouchPoints& source, const TouchPoints& 
         const Vec3& hand = target.hands[side];
         const Vec3& sourceHand = source.hands[side];
         for (const Thing& thing : ThingsOf(source, target))
-            Pull(side, frame, WeightOf(Distance(thing.source, sourceHand), thing.thickness),
-                 WantedAt(thing.source, thing.target, sourceHand, hand) - hand);
+        {
+            const double weight = WeightOf(Distance(thing.source, sourceHand), thing.thickness);
+            if (weight > 0.0)
+                Pull(side, frame, weight, GoalAt(thing, source, target, side) - hand);
+        }
         Pull(side, frame, clasp, side == 0 ? -apart : apart);
         if (!m_bHasFloor)
             continue;

@@ -4,20 +4,26 @@
 #include "Vec3.h"
 
 #include <array>
+#include <limits>
 #include <optional>
 #include <vector>
 
 namespace gw {
 
 /// The hands of a body and the points that hands touch; pairs are indexed by side. Positions are in
-/// millimeters of the target, above its floor, for the source as well.
+/// millimeters of the target, above its floor, for the source as well. Shoulders and reach matter only for
+/// the target.
 struct TouchPoints
 {
+    static constexpr double kNoLimit = std::numeric_limits<double>::infinity();
+
     std::array<Vec3, 2> hands{};
     std::array<Vec3, 2> hips{};
     std::array<Vec3, 2> knees{};
     Vec3 neck = kVec3Zero;
     Vec3 head = kVec3Zero; ///< middle of the head
+    std::array<Vec3, 2> shoulders{};
+    std::array<double, 2> reach{kNoLimit, kNoLimit}; ///< how far a hand can be from its shoulder
 };
 
 /// Plans how far to move each hand so that it keeps the source's distance to thighs, trunk, head, the other

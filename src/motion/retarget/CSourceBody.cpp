@@ -1,10 +1,18 @@
 #include "CSourceBody.h"
 
 #include "CNode.h"
+#include "Figures.h"
 
 #include <cmath>
 
 namespace gw {
+
+namespace {
+
+// A foot that stands rolls over its ball more often than over its heel.
+constexpr double kFlatShare = 0.25;
+
+} // namespace
 
 CSourceBody::CSourceBody(const CNode* root, const std::vector<LegJoints>& legs)
     : m_pkRoot(root), m_kLegs(legs), m_kFeet(legs)
@@ -52,6 +60,27 @@ std::vector<FootTouches> CSourceBody::Touches(double secondsPerFrame) const
     if (HasLegs())
         return m_kFeet.Touches(secondsPerFrame);
     return std::vector<FootTouches>(m_kLegs.size(), {{}, std::vector<float>(FrameCount(), 0.0f)});
+}
+
+float CSourceBody::FlatDrop(double secondsPerFrame) const
+{
+    std::vector<float> drops;
+    const std::vector<std::vector<Contact>> contacts = Contacts(secondsPerFrame);
+    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    {
+        const CLegTrack& track = Leg(leg);
+        if (!track.HasToe())
+            continue;
+        for (const Contact& contact : contacts[leg])
+        {
+            for (auto frame = static_cast<size_t>(contact.first); frame < static_cast<size_t>(contact.end);
+                 ++frame)
+                drops.push_back(track.Ankles()[frame].y - track.Toes()[frame].y);
+        }
+    }
+    if (drops.empty())
+        return FloorOf(m_kFeet.Legs(), &CLegTrack::Ankles) - FloorOf(m_kFeet.Legs(), &CLegTrack::Toes);
+    return Percentile(std::move(drops), kFlatShare);
 }
 
 } // namespace gw

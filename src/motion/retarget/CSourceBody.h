@@ -34,6 +34,9 @@ public:
     /// Returns the touches of each leg. They are empty, and nothing has landed, if the legs have no length.
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
+    /// Returns the height of the ankle above the toe in a foot that stands flat, measured while feet stand.
+    float FlatDrop(double secondsPerFrame) const;
+
 private:
     bool HasLegs() const;
 

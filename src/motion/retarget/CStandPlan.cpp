@@ -31,6 +31,7 @@ constexpr double kLiftHertz = 5.0;      // fast enough for the steps of a run, t
 constexpr double kRestWeight = 1e-4;    // weight of no lift at all; a standing leg has weight 1
 constexpr double kLiftLimit = 150.0;    // a source that needs more does not stand on a single floor
 constexpr double kMissed = 8.0;         // a standing foot whose sole is off by this much counts twice
+constexpr float kWristHeight = 30.0f;   // of a hand that is flat on the floor
 constexpr double kLeastFirmness = 0.02; // minimum for any leg, however far its knee is bent
 
 double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
@@ -44,16 +45,17 @@ double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 
 } // namespace
 
-CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, const Vec3& origin,
-                       double secondsPerFrame, bool holdFeet)
+CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, float lowestHand,
+                       const Vec3& origin, double secondsPerFrame, bool holdFeet)
     : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())),
       m_kRoots(source.FrameCount(), kVec3Zero), m_kLifts(source.FrameCount(), 0.0f)
 {
     const ContactsOfLegs contacts = source.Contacts(secondsPerFrame);
     PlaceRoot(origin);
-    StandOnFloor(contacts);
-    m_bHasFloor = std::ranges::any_of(contacts, [](const auto& leg) { return !leg.empty(); });
-    if (!holdFeet || !m_bHasFloor)
+    StandOnFloor(contacts, lowestHand);
+    const bool stands = std::ranges::any_of(contacts, [](const auto& leg) { return !leg.empty(); });
+    m_bHasFloor = m_bHasFloor || stands;
+    if (!holdFeet || !stands)
         return;
     const std::vector<FootTouches> touches = source.Touches(secondsPerFrame);
     for (size_t leg = 0; leg < legs_.size(); ++leg)
@@ -96,10 +98,12 @@ float CStandPlan::FreeSole(size_t leg, size_t frame) const
     return FreeAnkle(leg, frame).y - legs_[leg].At(frame).sole;
 }
 
-// Raises or lowers the whole motion onto the floor, using the median of the contacts or, without contacts,
-// the lowest frames.
-void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts)
+// Raises or lowers the whole motion onto the floor, using the median of the contacts. Without contacts, the
+// lowest frames of the feet are on the floor, or the hands if they get even lower, as in a handstand.
+void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts, float lowestHand)
 {
+    if (m_kRoots.empty())
+        return;
     std::vector<float> standing;
     std::vector<float> all;
     for (size_t leg = 0; leg < legs_.size(); ++leg)
@@ -112,12 +116,17 @@ void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts)
         for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
             all.push_back(-FreeSole(leg, frame));
     }
-    const float lift = standing.empty() ? Percentile(std::move(all), 1.0 - kFloorShare)
-                                        : Percentile(std::move(standing), 0.5);
+    float lift = standing.empty() ? Percentile(std::move(all), 1.0 - kFloorShare)
+                                  : Percentile(std::move(standing), 0.5);
+    const float hands = kWristHeight - (lowestHand - source_.Hips(0).y) * static_cast<float>(m_fScale);
+    if (standing.empty() && std::isfinite(hands) && hands > lift)
+    {
+        lift = hands;
+        m_bHasFloor = true;
+    }
     for (Vec3& root : m_kRoots)
         root.y += lift;
-    if (!m_kRoots.empty())
-        m_fRaised = lift - source_.Hips(0).y * static_cast<float>(m_fScale);
+    m_fRaised = lift - source_.Hips(0).y * static_cast<float>(m_fScale);
 }
 
 Vec3 CStandPlan::OnTarget(const Vec3& place) const

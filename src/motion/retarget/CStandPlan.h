@@ -15,10 +15,11 @@ class CStandPlan
 {
 public:
     /// Makes the plan. `legs` must already have read all frames of source and target; `legs` and `source`
-    /// must outlive the plan. The root starts above the x and z of `origin`. Without `holdFeet`, the legs
-    /// point in the source's directions, wherever that puts the feet.
-    CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, const Vec3& origin,
-               double secondsPerFrame, bool holdFeet);
+    /// must outlive the plan. `lowestHand` is the lowest y of the source's hands. The root starts above the x
+    /// and z of `origin`. Without `holdFeet`, the legs point in the source's directions, wherever that puts
+    /// the feet.
+    CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, float lowestHand,
+               const Vec3& origin, double secondsPerFrame, bool holdFeet);
 
     /// Returns the position of the root, in millimeters of the target.
     const Vec3& Root(size_t frame) const { return m_kRoots[frame]; }
@@ -27,7 +28,8 @@ public:
     /// Converts a position of the source to the target's scale and floor height. The horizontal position is
     /// only scaled, not moved to where the target is.
     Vec3 OnTarget(const Vec3& place) const;
-    /// Returns whether the source stands in any frame. A diver, for example, has no floor.
+    /// Returns whether the source stands in any frame, on its feet or its hands. In a jump that is cut out of
+    /// a longer motion, for example, nothing shows where the floor is.
     bool HasFloor() const { return m_bHasFloor; }
 
 private:
@@ -37,7 +39,7 @@ private:
     void PlaceRoot(const Vec3& origin);
     Vec3 FreeAnkle(size_t leg, size_t frame) const;
     float FreeSole(size_t leg, size_t frame) const;
-    void StandOnFloor(const ContactsOfLegs& contacts);
+    void StandOnFloor(const ContactsOfLegs& contacts, float lowestHand);
     void HoldLeg(size_t leg, const std::vector<Contact>& contacts, double secondsPerFrame);
     void LandLeg(size_t leg, const std::vector<float>& landed, double secondsPerFrame);
     void AddWish(size_t leg, size_t frame, CBandFit& lifts) const;

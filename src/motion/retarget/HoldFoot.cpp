@@ -34,11 +34,12 @@ namespace {
 
 // In leg lengths per second.
 
-constexpr double kStillSpeed = 0.1; // of a foot that certainly stands
-constexpr double kDriftSpeed = 0.2; // of a foot that moves instead of drifting
+constexpr double kStillSpeed = 0.12; // of a foot that certainly stands
+constexpr double kDriftSpeed = 0.4;  // of a foot that moves instead of drifting
 
-constexpr double kSpeedBlend = 0.05;  // seconds over which the speeds that set the pivot are smoothed
-constexpr double kDriftShare = 0.02;  // in leg lengths: half of a drift this long is kept
+constexpr double kSpeedBlend = 0.03;  // seconds over which the speeds that set the pivot are smoothed
+constexpr double kDriftShare = 0.03;  // in leg lengths: half of a drift this long is kept
+constexpr double kReturnHertz = 2.0;  // of the return to the free path, which then takes 0.2 s
 constexpr double kHoldSeconds = 10.0; // how long a foot that is held off its free path takes to creep back
 constexpr double kShakeHertz = 6.0;   // faster shaking of hips, legs and feet is left in the foot
 

@@ -1,0 +1,40 @@
+#include "FootPitch.h"
+
+#include "Directions.h"
+
+#include <gtest/gtest.h>
+
+#include <cmath>
+#include <limits>
+
+namespace gw {
+namespace {
+
+constexpr double kDegree = 0.0174532925;
+
+Vec3 Pitched(double degrees, double length)
+{
+    return {0.0f, static_cast<float>(length * std::sin(degrees * kDegree)),
+            static_cast<float>(length * std::cos(degrees * kDegree))};
+}
+
+double PitchOf(const Vec3& toe)
+{
+    return std::atan2(static_cast<double>(toe.y), static_cast<double>(toe.z)) / kDegree;
+}
+
+TEST(FootPitch, TurnsTowardTheWantedPlaceSoftlyAndNoFartherThanItsLimit)
+{
+    const auto turned = [](double degrees, const ToePlace& wanted) {
+        const Vec3 toe = Pitched(degrees, 100.0);
+        return PitchOf(Turned(toe, PitchFoot(toe, wanted))) - degrees;
+    };
+    EXPECT_NEAR(turned(-20.0, ToePlaceOf(Pitched(-18.0, 100.0))), 2.0, 0.05) << "nearly all of a little";
+    EXPECT_NEAR(turned(-20.0, ToePlaceOf(Pitched(25.0, 100.0))), 8.6, 0.05) << "little of a lot";
+    EXPECT_NEAR(turned(-20.0, {0.0, -300.0}), -8.6, 0.05) << "a place that no foot reaches";
+    EXPECT_NEAR(turned(-90.0, ToePlaceOf(Pitched(-85.0, 100.0))), 0.0, 0.01) << "an upright foot";
+    EXPECT_NEAR(turned(-20.0, {0.0, std::numeric_limits<double>::quiet_NaN()}), 0.0, 1e-4);
+}
+
+} // namespace
+} // namespace gw
