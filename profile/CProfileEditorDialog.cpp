@@ -164,6 +164,7 @@ bool CProfileEditorDialog::ReadProfile(std::string path, int* matched, int* tota
     if (load)
     {
         m_bDirty = false;
+        MarkAllRows(false);
         m_kRows.Clear();
         m_kHistory.Clear();
     }

@@ -34,12 +34,20 @@ void CProfileList::SetCurSel(int index)
 
 const std::string* CProfileList::GetItemText(int index) const
 {
-    return Has(index) ? &m_kItems[static_cast<size_t>(index)].m_kText : nullptr;
+    return Has(index) ? &m_kItems[Index(index)].m_kText : nullptr;
 }
 
 int CProfileList::GetItemUserData(int index) const
 {
-    return Has(index) ? m_kItems[static_cast<size_t>(index)].m_iUserData : 0;
+    return Has(index) ? m_kItems[Index(index)].m_iUserData : 0;
+}
+
+void CProfileList::SetItemWords(int index, const std::string& words, const std::string& tip)
+{
+    if (!Has(index))
+        return;
+    m_kItems[Index(index)].m_kWords = words;
+    m_kItems[Index(index)].m_kTip = tip;
 }
 
 } // namespace gw

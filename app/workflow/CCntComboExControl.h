@@ -21,6 +21,8 @@ public:
     /// Returns the text of an entry, valid until the list changes; null for an index out of range.
     virtual const std::string* GetItemText(int index) const = 0;
     virtual int GetItemUserData(int index) const = 0;
+    /// Shows a few words beside an entry, and a tool tip with its full text.
+    virtual void SetItemWords(int, const std::string&, const std::string&) {}
     /// Sets the font of the field and of the open list: a family, and each size in tenths of a point. A size
     /// of 0 or below keeps the current size. Does nothing if no text is shown.
     virtual void SetFont(const std::string&, int, int) {}
@@ -36,13 +38,21 @@ public:
     void SetCurSel(int index) override;
     const std::string* GetItemText(int index) const override;
     int GetItemUserData(int index) const override;
+    void SetItemWords(int index, const std::string& words, const std::string& tip) override;
+    /// Return an entry's words and tool tip; empty for an index out of range.
+    std::string ItemWords(int index) const { return Has(index) ? m_kItems[Index(index)].m_kWords : ""; }
+    std::string ItemTip(int index) const { return Has(index) ? m_kItems[Index(index)].m_kTip : ""; }
 
 private:
     struct Item
     {
         std::string m_kText;
         int m_iUserData;
+        std::string m_kWords = {};
+        std::string m_kTip = {};
     };
+
+    static size_t Index(int index) { return static_cast<size_t>(index); }
 
     bool Has(int index) const;
 

@@ -3,6 +3,7 @@
 #include "CMotionView.h"
 #include "CProfileOwner.h"
 #include "Notice.h"
+#include "Remedy.h"
 
 #include <memory>
 #include <optional>
@@ -21,6 +22,8 @@ struct FileDialogSetup
     std::string defaultExtension; ///< without dot
     std::string filter;
     std::string initialFolder; ///< empty for the system's default
+    std::string fileName = {}; ///< proposed name, without folder
+    std::string note = {};     ///< text shown in the dialog: what will happen to the files
 };
 
 /// A selected folder, with trailing separator, and the number of the filter selected with it, starting at 1.
@@ -63,6 +66,8 @@ public:
     virtual bool ShowsFindings() const { return false; }
     /// Returns whether an operation has taken long enough to show its progress.
     virtual bool IsProgressDue() { return false; }
+    /// Returns whether the user has asked, since the operation began, to end it without a result.
+    virtual bool IsCancelRequested() const { return false; }
     /// Repaints during an operation, without handling keys, clicks or timers.
     virtual void StayPainted() {}
     virtual void BeginWaitCursor() {}
@@ -83,6 +88,11 @@ public:
     virtual void SetChildScrollValue(std::string_view, int) {}
     /// Shows a text immediately, even while an operation blocks the window.
     virtual void SetChildText(std::string_view, const std::string&) {}
+    /// Sets a child's tool tip.
+    virtual void SetChildTip(std::string_view, const std::string&) {}
+    /// Shows text and buttons in the middle of an empty image child; removes them if the text is empty. A
+    /// click on a button goes to RunRemedy.
+    virtual void ShowHint(std::string_view, const Hint&) {}
     /// Creates the view inside an image child; null if it has none.
     virtual std::unique_ptr<CMotionView> CreateView(std::string_view) { return nullptr; }
     /// Creates the list of profiles on two children, a field and an arrow, with a font size in tenths of a

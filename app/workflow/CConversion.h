@@ -29,6 +29,8 @@ struct ConversionChoices
     bool align = false;    ///< re-expresses the source relative to a T-pose that suits the bone maps
     bool faithful = false; ///< trunk, hips, knees and feet follow the source
     bool holdHands = true; ///< with `faithful`: hands follow what they touch
+
+    bool operator==(const ConversionChoices&) const = default;
 };
 
 /// The input of a conversion. Nodes and rows are referenced and must outlive the conversion.

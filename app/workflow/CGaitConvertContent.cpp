@@ -6,6 +6,7 @@
 #include "AttachBoneMeshes.h"
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
+#include "CLongStep.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "Numbers.h"
@@ -98,9 +99,19 @@ int CGaitConvertContent::Open(const std::string& path)
     window_.RedrawFrame();
     const CWaitCursor wait(window_);
     ForgetFailedSave();
+    m_kMendable.clear();
     if (m_pkSourceView)
         m_pkSourceView->Stop();
-    if (!LoadSource(path))
+    bool loaded = false;
+    try
+    {
+        const CLongStep step(*this);
+        loaded = LoadSource(path);
+    } catch (const CCanceled&)
+    {
+        return 0;
+    }
+    if (!loaded)
     {
         NotifyOfFindings(path);
         ShowMessage(kInvalidSourceMessage, EButtons::OK);
@@ -111,7 +122,11 @@ int CGaitConvertContent::Open(const std::string& path)
     m_kSourcePath = path;
     RememberFolder(path);
     AddRecentFile(path);
+    m_kSavedPath.clear();
+    m_bConversionFailed = false;
     ShowSource();
+    NotifyOfUpAxis();
+    MeasureFits();
     PickStockProfile();
     if (m_pkProfile)
         m_pkProfile->ApplyProfile(nullptr, nullptr, nullptr);
@@ -137,6 +152,7 @@ bool CGaitConvertContent::LoadSource(const std::string& path)
 
 bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& path)
 {
+    motion.SetProgress([this](size_t done, size_t total) { ShowPercent("Opening", done, total); });
     const bool loaded = motion.Load(path);
     Notify(path, motion.Record());
     return loaded;
@@ -146,8 +162,11 @@ bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& pat
 void CGaitConvertContent::ShowSource()
 {
     CNode* const root = SourceRoot();
+    m_kOrigin.reset();
+    m_kResultFile.clear();
     if (m_bSourceIsContainer)
         AttachBoneMeshes(root);
+    FindUp();
     SetScene(m_pkSourceView.get(), root,
              m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
     LoadMotion(m_kBaseMotion, BaseFile());
@@ -164,6 +183,11 @@ void CGaitConvertContent::ShowSource()
 CNode* CGaitConvertContent::SourceRoot() const
 {
     return m_bSourceIsContainer ? FirstNode(m_spkSourceScene.GetRoot(0)) : m_kSourceMotion.motionRoot.Get();
+}
+
+SourceTiming CGaitConvertContent::Timing() const
+{
+    return m_bSourceIsContainer ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(m_kSourceMotion);
 }
 
 std::string CGaitConvertContent::SourceFolder() const

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CConversion.h"
+#include "CMapFits.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
 #include "COrrinStream.h"
@@ -8,7 +9,10 @@
 #include "CProfileOwner.h"
 #include "CResourceManager.h"
 #include "CRetargeter.h"
+#include "Captions.h"
 #include "FileStamp.h"
+#include "Notice.h"
+#include "Remedy.h"
 #include "ResultFile.h"
 
 #include <cstdint>
@@ -28,6 +32,8 @@ class CProfileEditorDialog;
 
 /// The playbar's last value; 0 to this value covers the whole motion.
 inline constexpr int kScrollRange = 256;
+/// The period of the clock that advances both views by one frame.
+inline constexpr int kClockMilliseconds = 17;
 
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// arrive by child name, requests go out through the two ports. Operations that return a number return 0 on
@@ -103,6 +109,20 @@ public:
     /// Drafts a profile for the open source, saves it with the user's and shows it in the editor.
     int DraftProfile();
 
+    // Next steps
+
+    /// Runs a remedy that was offered.
+    void RunRemedy(ERemedy remedy);
+    /// Runs the first remedy that the result's view offers, if any.
+    void TakeOffer();
+    /// Return what the empty source view and the empty result view say.
+    Hint SourceHint() const;
+    Hint ResultHint() const;
+    /// Returns the remedies for the notices of a step.
+    std::vector<Offer> OffersFor(std::span<const Notice> notices) const;
+    /// Returns the first lines of the first error among the notices of a step; empty if there is none.
+    std::string SummaryOf(std::span<const Notice> notices) const;
+
     // Help
 
     /// Finds the host product's executable; shows a message if it is not installed.
@@ -120,6 +140,7 @@ public:
     CBoneMapProfile* Profile() const { return m_pkProfile; }
     /// Returns the recently opened sources, newest first.
     std::vector<std::string> RecentFiles() const;
+    void ClearRecentFiles();
     CProfileEditorDialog* ProfileEditor() const { return m_pkProfileDialog.get(); }
     /// Returns the root of the open source, motion file or container; null if nothing is open.
     CNode* SourceRoot() const;
@@ -130,6 +151,7 @@ public:
 
 private:
     struct Command;
+    class CLongStep;
 
     // RecentFiles.cpp
     void AddRecentFile(const std::string& path);
@@ -151,14 +173,38 @@ private:
     void ReloadResult();
     bool Retarget(bool heedsShift);
     ConversionInput Input() const;
-    void ShowProgress(size_t done, size_t total);
+    SourceTiming Timing() const;
+    void PutBackResult(const CMotionFile& before);
+
+    // LongStep.cpp
+    void ShowProgress(const char* verb, const std::string& amount);
+    void ShowPercent(const char* verb, size_t done, size_t total);
 
     // DraftProfile.cpp
     std::string DraftName() const;
     void OpenDraft(const std::string& name);
+    std::string FreeName(const std::string& name) const;
     void NotifyOfFindings(const std::string& path);
+    void OpenMendedCopy();
+
+    // Offers.cpp
+    void FindUp();
+    void NotifyOfPose();
+    void NotifyOfUpAxis();
+    void MeasureFits();
+    void SortProfileList();
+    std::string MapName() const;
+    void UseBestMap();
+    std::string SaveAdapted(const ProfileChoice& choice);
+    bool SaveNewMap(const std::string& path, const std::string& text);
+    void OfferMap(Hint& hint) const;
+    Hint ReadyHint() const;
+    std::string AlignmentReason() const;
+    void ShowCaptions();
+    bool HasChangedSince() const;
 
     // ConvertBatch.cpp
+    std::string BatchNote() const;
     EBatchStep RunBatchFile(EBatchJob job, const std::string& path, size_t index);
     EBatchStep ConvertFile(const std::string& path, const std::string& output);
     EBatchStep PackageFile(const std::string& path, const std::string& output);
@@ -213,6 +259,15 @@ private:
     std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                           ///< last text passed to SetTitle
     ConversionChoices m_kChoices;
+    CMapFits m_kFits;                       ///< of the installed bone maps to the open source
+    std::string m_kUpAxis;                  ///< of the source, if it is not Y
+    std::string m_kMendable;                ///< the file read last, if it has faults that can be repaired
+    std::string m_kSavedPath;               ///< of the open source's last saved result
+    std::string m_kResultFile;              ///< the file with the result; empty if it is not saved
+    std::optional<ResultOrigin> m_kOrigin;  ///< of the result in its view; null if the view is empty
+    bool m_bConversionFailed = false;       ///< the last conversion of the open source
+    bool m_bCancelable = false;             ///< the user may cancel the long step that is running
+    bool m_bProgressShown = false;          ///< the title shows the progress of a long step
     bool m_bConverted = false;              ///< the open source has been converted
     bool m_bSaved = true;                   ///< the result has been saved, or there is none
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's

@@ -12,7 +12,6 @@ namespace {
 // The clock of both views, and the timer that updates the result view's buttons. The second never moves a
 // picture: after "play1", the motion runs only while the first timer runs as well.
 constexpr int kClockTimer = 0;
-constexpr int kClockMilliseconds = 17;
 constexpr int kResultTimer = 1;
 constexpr int kResultMilliseconds = 100;
 

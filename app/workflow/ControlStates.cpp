@@ -147,6 +147,7 @@ void CGaitConvertContent::UpdateControls()
     window_.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
     ShowHighlights();
     ShowChoices();
+    ShowCaptions();
 }
 
 void CGaitConvertContent::SetChoices(const ConversionChoices& choices)
@@ -158,11 +159,9 @@ void CGaitConvertContent::SetChoices(const ConversionChoices& choices)
 // Active options are visible without opening the menu.
 void CGaitConvertContent::ShowChoices()
 {
-    std::string text = m_kChoices.align ? "aligned" : "";
-    if (m_kChoices.faithful)
-        text += text.empty() ? "faithful" : ", faithful";
+    const std::string text = ChoiceWords(m_kChoices);
     window_.SetChildFace("options", text.empty() ? 0 : 1);
-    window_.SetChildText("#choices", text);
+    window_.SetChildTip("options", "Conversion options" + (text.empty() ? "" : ": " + text));
 }
 
 void CGaitConvertContent::ShowHighlights()

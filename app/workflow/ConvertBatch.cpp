@@ -9,6 +9,7 @@
 #include "FindingWords.h"
 #include "Paths.h"
 #include "StringTable.h"
+#include "Text.h"
 
 namespace gw {
 
@@ -20,8 +21,8 @@ constexpr const char* kFilter = "BVH file to HTR(*.bvh)|*.bvh|HTR file to ORN(*.
 
 int CGaitConvertContent::RunBatch(const std::string& initialFolder)
 {
-    const auto choice =
-        window_.AskFolder({{}, kFilter, initialFolder.empty() ? SourceFolder() : initialFolder});
+    const auto choice = window_.AskFolder(
+        {{}, kFilter, initialFolder.empty() ? SourceFolder() : initialFolder, {}, BatchNote()});
     if (!choice)
         return 0;
     window_.RedrawFrame();
@@ -44,6 +45,16 @@ int CGaitConvertContent::RunBatch(const std::string& initialFolder)
     ShowMessage(job == EBatchJob::ToMotion ? kConvertedMessage : kPackagedMessage, EButtons::OK, count);
     SetTitle({});
     return 1;
+}
+
+// Returns what a batch run would do.
+std::string CGaitConvertContent::BatchNote() const
+{
+    const CCntComboExControl& list = *m_pkProfileCombo;
+    const std::string* const selected = list.GetItemText(list.GetCurSel());
+    const std::string map = selected ? "BVH files are converted with the bone map " + Quoted(*selected) + '.'
+                                     : "No bone map is selected, so BVH files cannot be converted.";
+    return map + "\nResults are written next to their sources and replace files with the same name.";
 }
 
 EBatchStep CGaitConvertContent::RunBatchFile(EBatchJob job, const std::string& path, size_t index)

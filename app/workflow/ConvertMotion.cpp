@@ -2,7 +2,7 @@
 
 #include "AlignMotion.h"
 #include "CContentWindow.h"
-#include "CGaitConvertContent.h"
+#include "CLongStep.h"
 #include "CProfileEditorDialog.h"
 #include "CWaitCursor.h"
 #include "SourceTiming.h"
@@ -15,10 +15,21 @@ int CGaitConvertContent::ConvertMotion()
     const CWaitCursor wait(window_);
     ForgetFailedSave();
     ForViews(&CMotionView::Stop);
+    const CMotionFile before(m_kResultMotion);
     ReloadResult();
     if (m_pkProfile)
         m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
-    if (!Retarget(true))
+    NotifyOfPose();
+    try
+    {
+        const CLongStep step(*this);
+        m_bConversionFailed = !Retarget(true);
+    } catch (const CCanceled&)
+    {
+        PutBackResult(before);
+        return 0;
+    }
+    if (m_bConversionFailed)
         return 0;
     if (m_pkSourceView)
         m_pkSourceView->Seek(0, kScrollRange);
@@ -59,10 +70,12 @@ bool CGaitConvertContent::Retarget(bool heedsShift)
         return false;
     }
     const bool useLegs = !heedsShift || !window_.IsKeyDown(EKey::LeftShift);
-    conversion.Run(useLegs, [this](size_t done, size_t total) { ShowProgress(done, total); });
+    conversion.Run(useLegs, [this](size_t done, size_t total) { ShowPercent("Converting", done, total); });
     const SourceTiming result = TimingOf(m_kResultMotion);
     if (m_pkResultView)
         m_pkResultView->SetScene(m_kResultMotion.motionRoot.Get(), result.FrameStep(), result.lastFrame);
+    m_kOrigin = {MapName(), m_pkProfileDialog->Rows(), m_kChoices, useLegs};
+    m_kResultFile.clear();
     ShowTitle(m_kTitle);
     return true;
 }
@@ -72,8 +85,7 @@ ConversionInput CGaitConvertContent::Input() const
     CNode* const root = SourceRoot();
     ConversionInput input{.sourcePath = m_kSourcePath,
                           .source = root,
-                          .timing = m_bSourceIsContainer ? TimingOf(ConversionTrack(root))
-                                                         : TimingOf(m_kSourceMotion),
+                          .timing = Timing(),
                           .sourceRecord = m_kSourceMotion.Record(),
                           .profilePath = m_kProfilePath,
                           .profileName = {},
@@ -84,13 +96,21 @@ ConversionInput CGaitConvertContent::Input() const
     return input;
 }
 
-void CGaitConvertContent::ShowProgress(size_t done, size_t total)
+// Shows the result from before a canceled conversion again. If there was none, the skeleton may have been
+// partly baked and is read again.
+void CGaitConvertContent::PutBackResult(const CMotionFile& before)
 {
-    if (!window_.IsProgressDue())
-        return;
-    const std::string percent = std::to_string(100 * done / total) + " %";
-    ShowTitle(m_kTitle.empty() ? "Converting " + percent : m_kTitle + ", " + percent);
-    window_.StayPainted();
+    if (m_kOrigin)
+    {
+        m_kResultMotion.motionRoot = before.motionRoot;
+        m_kResultMotion.restRoot = before.restRoot;
+        m_kResultMotion.quarterTurns = before.quarterTurns;
+    }
+    else
+        LoadResult();
+    if (m_pkProfile)
+        m_pkProfile->SetResultScene(m_kResultMotion.motionRoot.Get());
+    UpdateControls();
 }
 
 } // namespace gw

@@ -77,7 +77,7 @@ std::string TurnedSentence(const std::vector<ProfileDoubt>& doubts)
     if (count == 0)
         return {};
     const std::string more = count > kNamed ? " and " + std::to_string(count - kNamed) + " more" : "";
-    return "bones end up rotated sideways, which --align may fix: " + joints + more;
+    return "bones end up rotated sideways, which aligning may fix: " + joints + more;
 }
 
 } // namespace
@@ -122,13 +122,13 @@ std::vector<Notice> DoubtWarnings(const std::string& source, const ProfileChoice
     std::vector<Notice> warnings;
     for (const std::string& words : DoubtWords(choice.verdict))
         warnings.push_back(MakeNotice(
-            source, "doubt", "profile " + Quoted(choice.profile.name) + ": " + words, ESeverity::Warning));
+            source, "doubt", "bone map " + Quoted(choice.profile.name) + ": " + words, ESeverity::Warning));
     return warnings;
 }
 
 Notice DoubtfulNotice(const std::string& source, const ProfileChoice& choice)
 {
-    std::string words = "the best-matching profile, " + Quoted(choice.profile.name) + ", is doubtful";
+    std::string words = "the best-matching bone map, " + Quoted(choice.profile.name) + ", is doubtful";
     for (const std::string& doubt : DoubtWords(choice.verdict))
         words += "\n  " + doubt;
     words += "\n  pass --profile to use it anyway";

@@ -23,7 +23,7 @@ namespace gw {
 
 namespace {
 
-constexpr uint64_t kExamBytesLimit = uint64_t{64} << 20; // a person would have to wait for more
+constexpr uint64_t kExamBytesLimit = uint64_t{16} << 20; // a person would have to wait for more
 
 // Returns the rows that a person should check, or empty.
 std::string UnsureRows(const SuggestedProfile& draft)
@@ -46,10 +46,14 @@ bool IsShort(const std::string& path)
 
 } // namespace
 
-// Returns an unused name, because a second profile with the same name could not be selected.
 std::string CGaitConvertContent::DraftName() const
 {
-    const std::string name = SuggestedName(SplitPath(m_kSourcePath).stem);
+    return FreeName(SuggestedName(SplitPath(m_kSourcePath).stem));
+}
+
+// Returns an unused name, because a second profile with the same name could not be selected.
+std::string CGaitConvertContent::FreeName(const std::string& name) const
+{
     std::string free = name;
     for (int number = 2; IsListed(free); ++number)
         free = name + ' ' + std::to_string(number);
@@ -72,15 +76,8 @@ int CGaitConvertContent::DraftProfile()
     }
     const std::string name = DraftName();
     const std::string path = NewProfilePath(*this);
-    CSafeFile file;
-    if (!file.Open(path) ||
-        !file.Write(ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())) ||
-        !file.Commit())
-    {
-        window_.Notify(MakeNotice(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()}));
-        window_.ShowMessageBox(kOwnMessage, "The drafted bone map cannot be written.", EButtons::OK);
+    if (!SaveNewMap(path, ProfileText(name, ProfileRateOf(SourceRoot()), kVec3Zero, draft.Table())))
         return 0;
-    }
     OpenDraft(name);
     if (const std::string rows = UnsureRows(draft); !rows.empty())
         window_.Notify(MakeNotice(path, "unsure-rows", "check these rows of the bone map: " + Printable(rows),
@@ -92,6 +89,7 @@ int CGaitConvertContent::DraftProfile()
 void CGaitConvertContent::OpenDraft(const std::string& name)
 {
     RefreshProfileList();
+    MeasureFits();
     SelectProfileByName(name);
     m_pkProfileDialog->Show();
     window_.ShowProfileEditor(true);
@@ -105,11 +103,34 @@ void CGaitConvertContent::NotifyOfFindings(const std::string& path)
         return;
     CFileExam exam;
     exam.ExamineBVH(path);
+    m_kMendable = exam.Findings().MendsAny() ? path : "";
     for (const Finding& finding : exam.Findings().Sorted())
     {
         if (finding.severity != ESeverity::Note && !IsOfReader(finding.reason))
             window_.Notify(MakeNotice(path, finding));
     }
+}
+
+// The copy is a new file next to the original.
+void CGaitConvertContent::OpenMendedCopy()
+{
+    if (m_kMendable.empty() || !ConfirmDiscard())
+        return;
+    const PathParts parts = SplitPath(m_kMendable);
+    const std::string copy = parts.folder + parts.stem + " (mended)";
+    std::string path = copy + parts.extension;
+    for (int number = 2; FileExists(path); ++number)
+        path = copy + ' ' + std::to_string(number) + parts.extension;
+    CFileExam exam;
+    exam.ExamineBVH(m_kMendable);
+    CSafeFile::KeepExisting(path);
+    if (exam.WriteMended(path))
+    {
+        Open(path);
+        return;
+    }
+    window_.Notify(MakeNotice(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()}));
+    window_.ShowMessageBox(kOwnMessage, "The mended copy cannot be written.", EButtons::OK);
 }
 
 } // namespace gw

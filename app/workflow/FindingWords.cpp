@@ -70,9 +70,9 @@ constexpr Sentence kSentences[] = {
     Row(DoubledOffsets, "doubled-offsets", "joint positions repeat the offsets, so bones are twice as long",
         "export rotations only, or remove the position channels"),
     Row(RestPose, "rest-pose", "the rest pose is not a T-pose, so limbs may end up rotated",
-        "set rotation offsets in the profile"),
+        "align the motion, or set rotation offsets in the bone map"),
     Row(BadScale, "bad-scale", "the sizes of the skeletons could not be compared; the scale is 1",
-        "map both feet and the left thigh in the profile"),
+        "map both feet and the left thigh in the bone map"),
     Row(UnknownChannel, "unknown-channel", "a channel has an unknown name and was ignored"),
     Row(CutName, "cut-name", "a name could not be used as it is and was changed"),
     Row(OpenHeader, "open-header", "no empty line closes the header, so the motion has no frames",
@@ -142,15 +142,15 @@ constexpr Sentence kSentences[] = {
     // Found by a conversion.
     Row(NoScene, "no-scene", "there is no source or no target skeleton",
         "make sure that base.htr is next to the program"),
-    Row(NoProfile, "no-profile", "no profile is selected", "choose one that matches the source's bones"),
-    Row(BadProfile, "profile", "the profile cannot be read"),
-    Row(NoRootRow, "no-root-row", "no row of the profile drives the target's root bone", kMapHip),
-    Row(NoRootSource, "no-root-source", "the profile keeps the target's root bone fixed", kMapHip),
+    Row(NoProfile, "no-profile", "no bone map is selected", "choose one that matches the source's bones"),
+    Row(BadProfile, "profile", "the bone map cannot be read"),
+    Row(NoRootRow, "no-root-row", "no row of the bone map drives the target's root bone", kMapHip),
+    Row(NoRootSource, "no-root-source", "the bone map keeps the target's root bone fixed", kMapHip),
     Row(NothingToConvert, "no-frames", "the motion has no frames, so there is nothing to convert"),
-    Row(NoBody, "no-body", "the profile maps too few joints to align the motion",
+    Row(NoBody, "no-body", "the bone map has too few joints to align the motion",
         "map the hip, both thighs, and the neck or head"),
     Row(TurnedAtRest, "turned-at-rest", "limbs may end up rotated, because the rest poses differ",
-        "align the motion, or set rotation offsets in the profile"),
+        "align the motion, or set rotation offsets in the bone map"),
 };
 
 constexpr bool IsInOrder()

@@ -67,7 +67,7 @@ std::string MissingLines(const CProfileFit& fit)
 
 Notice MisfitNotice(const std::string& source, const CProfileFit& fit)
 {
-    const std::string summary = "profile " + Quoted(fit.name) + ": " + FitSummary(fit);
+    const std::string summary = "bone map " + Quoted(fit.name) + ": " + FitSummary(fit);
     const std::string lines = fit.missing.empty() ? MissingLines(fit) : NearestLines(fit);
     return MakeNotice(source, "misfit", summary + '\n' + lines);
 }

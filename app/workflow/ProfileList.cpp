@@ -63,6 +63,7 @@ void CGaitConvertContent::RefreshProfileList()
     const std::string custom = ProfileFile({});
     for (const std::string& file : FilesInFolder(custom, kProfileExtension))
         AddProfile(custom + file, kCustom);
+    SortProfileList();
 }
 
 void CGaitConvertContent::KeepStockNames()
@@ -198,6 +199,8 @@ void CGaitConvertContent::ProfileSetChanged()
     if (!m_pkProfile)
         return;
     RefreshProfileList();
+    if (m_pkProfileDialog->IsDirty())
+        MeasureFits(); // a file may have been written
     CCntComboExControl& list = *m_pkProfileCombo;
     std::string name;
     m_pkProfile->GetProfileName(name);

@@ -8,7 +8,7 @@ namespace gw {
 namespace {
 
 constexpr const char* kRecentSetting = "RecentFiles";
-constexpr size_t kRecentCount = 8;
+constexpr size_t kRecentCount = 9; // one per digit key
 
 } // namespace
 
@@ -23,6 +23,11 @@ std::vector<std::string> CGaitConvertContent::RecentFiles() const
             paths.emplace_back(line);
     }
     return paths;
+}
+
+void CGaitConvertContent::ClearRecentFiles()
+{
+    platform_.WriteSetting(kRecentSetting, {});
 }
 
 void CGaitConvertContent::AddRecentFile(const std::string& path)

@@ -2,9 +2,10 @@
 
 #include "CBoneMapProfile.h"
 #include "CContentWindow.h"
-#include "CGaitConvertContent.h"
+#include "CLongStep.h"
 #include "CWaitCursor.h"
 #include "FindingWords.h"
+#include "Paths.h"
 #include "ResultFile.h"
 #include "StringTable.h"
 
@@ -18,11 +19,22 @@ constexpr const char* kNotSaved = "not saved: "; // prefix of the title after a 
 
 int CGaitConvertContent::SaveResult()
 {
-    const auto path = window_.AskSaveFile({"Kinetra", Message(kSaveFilterMessage), {}});
+    const PathParts proposal = SplitPath(m_kSavedPath.empty() ? m_kSourcePath : m_kSavedPath);
+    const auto path =
+        window_.AskSaveFile({"Kinetra", Message(kSaveFilterMessage), proposal.folder, proposal.stem});
     if (!path)
         return 1;
     const CWaitCursor wait(window_);
-    WriteResult(*path);
+    try
+    {
+        const CLongStep step(*this);
+        if (WriteResult(*path))
+            m_kSavedPath = m_kResultFile = *path;
+    } catch (const CCanceled&)
+    {
+        m_kResultMotion.motionRoot->UpdateScene(0.0f, true); // as after a complete save
+        return 1;
+    }
     m_bSaved = true; // set even if saving failed: title and message box report that
     std::string title;
     std::string text = Message(kShowFileMessage);
@@ -33,6 +45,7 @@ int CGaitConvertContent::SaveResult()
         text = "Nothing was written.\n" + NoticeLine(notice) + "\n\n" + text;
     }
     SetTitle(title);
+    ShowCaptions();
     if (window_.ShowMessageBox(kShowFileMessage, text, EButtons::OKCancel) == EAnswer::OK)
         window_.ShowInFileManager(*path);
     return 1;
@@ -48,7 +61,11 @@ void CGaitConvertContent::ForgetFailedSave()
 bool CGaitConvertContent::WriteResult(const std::string& path)
 {
     m_kWriteRecord.Clear();
-    const bool written = WriteResultFile(m_kResultMotion, path, m_pkProfile->GetFrameRate(), m_kWriteRecord);
+    const SaveProgress progress = [this](size_t bytes) {
+        ShowProgress("Saving", std::to_string(bytes >> 20) + " MB");
+    };
+    const bool written =
+        WriteResultFile(m_kResultMotion, path, m_pkProfile->GetFrameRate(), m_kWriteRecord, progress);
     Notify(path, m_kWriteRecord);
     return written;
 }

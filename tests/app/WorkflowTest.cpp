@@ -281,10 +281,10 @@ TEST_F(ContentTest, DropsAndRecentFilesOpenAsTheDialogDoes)
     for (int i = 0; i < 9; ++i)
         m_kContent.OpenFile(Write("walk" + std::to_string(i) + ".bvh", BvhText(kPoserBones)));
     m_kContent.OpenFile(walk);
-    ASSERT_EQ(m_kContent.RecentFiles().size(), 8u);
-    EXPECT_EQ(std::ranges::count(m_kPlatform.m_kSettings["RecentFiles"], '\n'), 8);
+    ASSERT_EQ(m_kContent.RecentFiles().size(), 9u);
+    EXPECT_EQ(std::ranges::count(m_kPlatform.m_kSettings["RecentFiles"], '\n'), 9);
     EXPECT_EQ(m_kContent.RecentFiles().front(), walk);
-    EXPECT_EQ(m_kContent.RecentFiles().back(), m_kFolder.Path("walk2.bvh"));
+    EXPECT_EQ(m_kContent.RecentFiles().back(), m_kFolder.Path("walk1.bvh"));
     m_kContent.OpenFile(walk);
     EXPECT_EQ(m_kContent.RecentFiles()[1], m_kFolder.Path("walk8.bvh")) << "once, however often it is opened";
 
@@ -302,7 +302,7 @@ TEST_F(ContentTest, ALongConversionTellsItsProgressInTheTitle)
     m_kWindow.m_kTitles.clear();
     Do("click convert");
     ASSERT_GE(m_kWindow.m_kTitles.size(), 3u);
-    EXPECT_EQ(m_kWindow.m_kTitles[1], "Gaitwright v2.0 - Converting 32 %");
+    EXPECT_EQ(m_kWindow.m_kTitles[1], "Gaitwright v2.0 - Converting 32 % (Esc cancels)");
     EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
 }
 

@@ -245,18 +245,18 @@ TEST(MainWindow, WhatIsDroppedOrRecentOpens)
 TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
 {
     CPerson person;
-    const auto shown = [&] { return static_cast<QLabel*>(person.Child("#choices"))->text(); };
-    EXPECT_EQ(shown(), QString());
+    const auto shown = [&] { return person.Child("options")->toolTip(); };
+    const QString none = shown();
     ChooseOption(person, 1);
     EXPECT_TRUE(person.Content().Choices().faithful);
     EXPECT_FALSE(person.Content().Choices().align);
-    EXPECT_EQ(shown(), QStringLiteral("faithful"));
+    EXPECT_EQ(shown(), none + QStringLiteral(": faithful"));
     ChooseOption(person, 0);
-    EXPECT_EQ(shown(), QStringLiteral("aligned, faithful"));
+    EXPECT_EQ(shown(), none + QStringLiteral(": aligned, faithful"));
     ChooseOption(person, 1);
-    EXPECT_EQ(shown(), QStringLiteral("aligned"));
+    EXPECT_EQ(shown(), none + QStringLiteral(": aligned"));
     person.Restart();
-    EXPECT_EQ(shown(), QString());
+    EXPECT_EQ(shown(), none);
 }
 
 TEST(MainWindow, ABoneMapIsDraftedForASourceThatNoneFits)

@@ -24,7 +24,7 @@ EAnswer Ask(EButtons buttons, const Act& act, const std::string& text = "Text",
             const std::string& details = {})
 {
     const CDialogAnswers answers(act);
-    return RunMessageBox(nullptr, "Caption", text, buttons, details);
+    return RunMessageBox(nullptr, "Caption", text, buttons, {{}, {}, details});
 }
 
 QAbstractButton* Button(QWidget& box, const char* name)

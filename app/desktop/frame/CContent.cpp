@@ -4,8 +4,10 @@
 
 #include "CContent.h"
 
+#include "CElidedLabel.h"
 #include "CGLView.h"
 #include "CGaitConvertContent.h"
+#include "CInputGate.h"
 #include "CLeftKeys.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
@@ -19,7 +21,6 @@
 #include <QApplication>
 #include <QComboBox>
 #include <QCoreApplication>
-#include <QLabel>
 #include <QMouseEvent>
 
 namespace gw {
@@ -43,6 +44,7 @@ CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : Q
         Connect(widget);
     }
     ShowNoteCount();
+    connect(qApp, &QApplication::focusChanged, this, [this] { update(); });
 }
 
 CContent::~CContent() = default;
@@ -61,6 +63,8 @@ void CContent::Connect(QWidget* child)
         connect(button, &QPushButton::clicked, this, [this, button] { Click(ToUtf8(button->objectName())); });
     else if (auto* title = dynamic_cast<CTitleLabel*>(child))
         title->mouseDown = [this](const QPoint& position) { titleDown(position); };
+    else if (child->property("kind").toString() == QLatin1String("view"))
+        MakeHint(child);
     else
         ConnectBar(child);
 }
@@ -152,7 +156,9 @@ bool CContent::IsProgressDue()
 
 void CContent::StayPainted()
 {
-    QCoreApplication::processEvents(QEventLoop::ExcludeUserInputEvents | QEventLoop::ExcludeSocketNotifiers);
+    const CInputGate gate;
+    QCoreApplication::processEvents(QEventLoop::ExcludeSocketNotifiers);
+    m_bCancelRequested = m_bCancelRequested || gate.WasEscapePressed();
     m_kSincePainted.start();
 }
 
@@ -161,6 +167,7 @@ void CContent::BeginWaitCursor()
     if (m_iWaits++ > 0)
         return;
     m_kNotices.clear();
+    m_bCancelRequested = false;
     ShowNoteCount();
     m_kSincePainted.start();
     QGuiApplication::setOverrideCursor(Qt::WaitCursor);
@@ -186,8 +193,13 @@ void CContent::PostCloseRequest()
 
 void CContent::EnableChild(std::string_view child, bool on)
 {
-    if (auto* widget = Child<QWidget>(child))
-        widget->setEnabled(on);
+    auto* const widget = Child<QWidget>(child);
+    if (!widget)
+        return;
+    const bool loses = !on && widget->isEnabled() && window()->focusWidget() == widget;
+    widget->setEnabled(on);
+    if (loses)
+        FocusView();
 }
 
 void CContent::SetChildFace(std::string_view child, int face)
@@ -224,8 +236,14 @@ void CContent::SetChildText(std::string_view child, const std::string& text)
 {
     if (auto* title = Child<CTitleLabel>(child))
         title->ShowAtOnce(ToQString(text));
-    else if (auto* label = Child<QLabel>(child))
-        label->setText(ToQString(text));
+    else if (auto* caption = Child<CElidedLabel>(child))
+        caption->ShowText(ToQString(text));
+}
+
+void CContent::SetChildTip(std::string_view child, const std::string& text)
+{
+    if (auto* widget = Child<QWidget>(child))
+        widget->setToolTip(ToQString(text));
 }
 
 std::unique_ptr<CMotionView> CContent::CreateView(std::string_view child)

@@ -15,9 +15,11 @@
 namespace gw {
 
 class CGaitConvertContent;
+class CHintPanel;
 class CLeftKeys;
 class CProfileEditorWindow;
 class CSkin;
+struct BoxExtras;
 
 /// The face of the main window: the children of a skin. It forwards clicks, drags and ticks to the
 /// conversion, which replies through the port that this class implements.
@@ -52,6 +54,7 @@ public:
     bool ShowsFindings() const override { return true; }
     bool IsProgressDue() override;
     void StayPainted() override;
+    bool IsCancelRequested() const override { return m_bCancelRequested; }
     void BeginWaitCursor() override;
     void EndWaitCursor() override;
     void RedrawFrame() override;
@@ -63,6 +66,8 @@ public:
     void SetChildScrollRange(std::string_view child, int low, int high) override;
     void SetChildScrollValue(std::string_view child, int value) override;
     void SetChildText(std::string_view child, const std::string& text) override;
+    void SetChildTip(std::string_view child, const std::string& text) override;
+    void ShowHint(std::string_view child, const Hint& hint) override;
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
     CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow, int fontSize) override;
     void SetTimer(int id, int milliseconds) override;
@@ -76,6 +81,7 @@ public:
 
 protected:
     void mousePressEvent(QMouseEvent* event) override;
+    void paintEvent(QPaintEvent* event) override;
 
 private:
     template <class Widget>
@@ -85,6 +91,11 @@ private:
     void Click(const std::string& child);
     void ShowNoteCount();
     void ShowNotes();
+    void MakeHint(QWidget* view);
+    void FocusView();
+    void FocusNext();
+    void RunSoon(ERemedy remedy);
+    EAnswer AskWithOffers(const std::string& text, EButtons buttons, const BoxExtras& extras);
     std::string Notes() const;
 
     const CLeftKeys& keys_;
@@ -95,7 +106,9 @@ private:
     CProfileCombo m_kCombo;
     std::vector<Notice> m_kNotices; ///< of the current step, or of the last one until the next begins
     QElapsedTimer m_kSincePainted;  ///< during an operation
+    std::map<std::string, CHintPanel*, std::less<>> m_kHints; ///< by view
     int m_iWaits = 0;
+    bool m_bCancelRequested = false; ///< during an operation
 };
 
 } // namespace gw

@@ -32,15 +32,48 @@ EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons butto
 {
     const CArrowCursor arrow;
     // Notices are cleared when a step begins, so outside a step they are from an earlier one.
-    const std::string details = m_iWaits > 0 && EndsStep(id) ? Notes() : std::string();
-    return RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, details);
+    if (m_iWaits == 0 || !EndsStep(id))
+        return AskWithOffers(text, buttons, {});
+    BoxExtras extras;
+    extras.details = Notes();
+    if (id == kInvalidSourceMessage || id == kCannotConvertMessage)
+        extras.summary = m_pkLogic->SummaryOf(m_kNotices);
+    for (const Offer& offer : m_pkLogic->OffersFor(m_kNotices))
+        extras.offers.push_back(offer.button);
+    return AskWithOffers(text, buttons, extras);
+}
+
+EAnswer CContent::AskWithOffers(const std::string& text, EButtons buttons, const BoxExtras& extras)
+{
+    const std::vector<Offer> offers = m_pkLogic->OffersFor(m_kNotices);
+    int chosen = -1;
+    const EAnswer answer =
+        RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, extras, &chosen);
+    if (chosen >= 0)
+        RunSoon(offers[static_cast<size_t>(chosen)].remedy);
+    return answer;
+}
+
+// After the operation that asked.
+void CContent::RunSoon(ERemedy remedy)
+{
+    QTimer::singleShot(0, this, [this, remedy] {
+        if (IsBusy())
+            RunSoon(remedy);
+        else
+            m_pkLogic->RunRemedy(remedy);
+    });
 }
 
 void CContent::ShowNotes()
 {
-    RunMessageBox(this, m_pkLogic->Message(kTitleMessage),
-                  ToUtf8(QCoreApplication::translate("Face", "Warnings from the last step")), EButtons::OK,
-                  Notes(), EDetails::Unfolded);
+    BoxExtras extras;
+    extras.details = Notes();
+    extras.shown = EDetails::Unfolded;
+    for (const Offer& offer : m_pkLogic->OffersFor(m_kNotices))
+        extras.offers.push_back(offer.button);
+    AskWithOffers(ToUtf8(QCoreApplication::translate("Face", "Warnings from the last step")), EButtons::OK,
+                  extras);
 }
 
 std::optional<std::string> CContent::AskOpenFile(const FileDialogSetup& setup)

@@ -88,6 +88,8 @@ CGaitConvertFrame::CGaitConvertFrame(const CSkin& skin, const CLeftKeys& keys, C
     setAcceptDrops(true);
     Place(skin.Size());
     AddShortcuts();
+    if (auto* open = findChild<QWidget*>(QStringLiteral("open")))
+        open->setFocus();
 }
 
 // Face and editor refer to the conversion until they are destroyed.
@@ -121,6 +123,7 @@ void CGaitConvertFrame::AddShortcuts()
     }
     // Not a click: with the left Ctrl key, that would start a batch run.
     add(Qt::CTRL | Qt::Key_O, [this] { m_spContent->OpenSource(); });
+    add(Qt::CTRL | Qt::Key_M, [this] { m_spContent->TakeOffer(); });
     add(QKeyCombination(Qt::Key_F), [this] { m_pkFace->FrameAll(); });
 }
 

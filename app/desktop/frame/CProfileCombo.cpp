@@ -1,5 +1,6 @@
 #include "CProfileCombo.h"
 
+#include "CMapField.h"
 #include "QtText.h"
 
 #include <QAbstractButton>
@@ -53,6 +54,17 @@ void CProfileCombo::SetCurSel(int index)
     ShowSelection();
 }
 
+void CProfileCombo::SetItemWords(int index, const std::string& words, const std::string& tip)
+{
+    CProfileList::SetItemWords(index, words, tip);
+    if (!m_kField)
+        return;
+    m_kField->setItemData(index, ToQString(words), CMapField::kWordsRole);
+    m_kField->setItemData(index, ToQString(tip), Qt::ToolTipRole);
+    if (index == GetCurSel())
+        ShowSelection();
+}
+
 void CProfileCombo::SetFont(const std::string& family, int fieldSize, int listSize)
 {
     if (!m_kField)
@@ -64,6 +76,7 @@ void CProfileCombo::SetFont(const std::string& family, int fieldSize, int listSi
 void CProfileCombo::SetChildren(QComboBox* field, QAbstractButton* arrow, int fontSize)
 {
     m_kField = field;
+    m_kTip = field->toolTip();
     ChangeFont(*field, {}, fontSize);
     for (int index = 0; const std::string* text = GetItemText(index); ++index)
         field->addItem(ToQString(*text));
@@ -79,6 +92,8 @@ void CProfileCombo::ShowSelection()
         return;
     const QSignalBlocker quiet(m_kField);
     m_kField->setCurrentIndex(GetCurSel());
+    const QString tip = ToQString(ItemTip(GetCurSel()));
+    m_kField->setToolTip(tip.isEmpty() ? m_kTip : tip);
 }
 
 void CProfileCombo::Choose(int index)

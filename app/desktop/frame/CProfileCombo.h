@@ -3,6 +3,7 @@
 #include "CCntComboExControl.h"
 
 #include <QPointer>
+#include <QString>
 #include <functional>
 
 class QAbstractButton;
@@ -21,6 +22,7 @@ public:
     void AddItem(const std::string& text, int userData) override;
     void DeleteItem(int index) override;
     void SetCurSel(int index) override;
+    void SetItemWords(int index, const std::string& words, const std::string& tip) override;
 
     void SetFont(const std::string& family, int fieldSize, int listSize) override;
 
@@ -34,6 +36,7 @@ private:
     void Choose(int index);
 
     QPointer<QComboBox> m_kField;
+    QString m_kTip; // of the field if nothing is selected
     std::function<void(int)> notify_;
 };
 

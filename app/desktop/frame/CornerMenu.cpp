@@ -2,6 +2,7 @@
 
 #include "CGaitConvertContent.h"
 #include "CGaitConvertFrame.h"
+#include "Paths.h"
 #include "QtText.h"
 
 #include <QCoreApplication>
@@ -22,13 +23,17 @@ void AddRecentFiles(QMenu& menu, CGaitConvertFrame& frame)
 {
     const auto paths = frame.Content().RecentFiles();
     menu.addAction(Words(paths.empty() ? "No recent files" : "Recent files"))->setEnabled(false);
-    for (const std::string& path : paths)
+    for (int number = 1; const std::string& path : paths)
     {
         QString text = menu.fontMetrics().elidedText(ToQString(path), Qt::ElideMiddle, kPathPixels);
         text.replace(QLatin1Char('&'), QStringLiteral("&&"));
-        QObject::connect(menu.addAction(text), &QAction::triggered, &frame,
-                         [&frame, path] { frame.OpenSoon(path); });
+        QAction* const action = menu.addAction(QStringLiteral("&%1  %2").arg(number++).arg(text));
+        action->setEnabled(FileExists(path));
+        QObject::connect(action, &QAction::triggered, &frame, [&frame, path] { frame.OpenSoon(path); });
     }
+    if (!paths.empty())
+        QObject::connect(menu.addAction(Words("Clear recent files")), &QAction::triggered, &frame,
+                         [&frame] { frame.Content().ClearRecentFiles(); });
 }
 
 void AddCommand(QMenu& menu, const char* text, const char* keys, CGaitConvertFrame& frame,
@@ -49,7 +54,7 @@ QMenu* MakeCornerMenu(CGaitConvertFrame& frame)
     AddCommand(*menu, "Open...", "Ctrl+O", frame, [](CGaitConvertFrame& f) { f.Content().OpenSource(); });
     AddCommand(*menu, "Help", "F1", frame, [](CGaitConvertFrame& f) { f.Content().ChildClick("help"); });
     menu->addSeparator();
-    AddCommand(*menu, "Minimise", "", frame, [](CGaitConvertFrame& f) { f.showMinimized(); });
+    AddCommand(*menu, "Minimize", "", frame, [](CGaitConvertFrame& f) { f.showMinimized(); });
     AddCommand(*menu, "Close", "Alt+F4", frame,
                [](CGaitConvertFrame& f) { f.Content().ChildClick("close"); });
     return menu;

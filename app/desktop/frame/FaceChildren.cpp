@@ -2,25 +2,23 @@
 
 #include "FaceChildren.h"
 
+#include "CElidedLabel.h"
+#include "CMapField.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
 #include "CTitleLabel.h"
 #include "QtText.h"
 
-#include <QAbstractItemView>
 #include <QComboBox>
 #include <QCoreApplication>
-#include <QKeyEvent>
 #include <QLabel>
 #include <QPainter>
-#include <QScrollBar>
 
 namespace gw {
 
 namespace {
 
 constexpr QSize kIconSize(20, 20);
-constexpr int kMostVisibleProfiles = 20;
 
 class CPicture : public QWidget
 {
@@ -43,9 +41,10 @@ private:
 
 QWidget* MakeLabel(const SkinChild& child, const CSkin& skin, QWidget* face)
 {
-    auto* const label = new QLabel(skin.Text(child.name), face);
+    auto* const label = new CElidedLabel(face);
     label->setTextFormat(Qt::PlainText);
     label->setAlignment(Qt::AlignVCenter | (child.kind == "value" ? Qt::AlignRight : Qt::AlignLeft));
+    label->ShowText(skin.Text(child.name));
     return label;
 }
 
@@ -70,27 +69,12 @@ QWidget* MakeView(const CLeftKeys& keys, QWidget* face)
     return words;
 }
 
-// Makes the list as wide as its texts, below a field as wide as the skin says, because profiles of one family
-// differ at the end of their names.
-class CProfileField : public QComboBox
+// A view gets the keyboard when the control that had it is disabled.
+QWidget* MakeFocusableView(const CLeftKeys& keys, QWidget* face)
 {
-public:
-    using QComboBox::QComboBox;
-    void showPopup() override
-    {
-        view()->setMinimumWidth(view()->sizeHintForColumn(0) +
-                                view()->verticalScrollBar()->sizeHint().width());
-        QComboBox::showPopup();
-    }
-};
-
-QWidget* MakeCombo(QWidget* face)
-{
-    auto* const combo = new CProfileField(face);
-    combo->setMaxVisibleItems(kMostVisibleProfiles);
-    combo->setSizeAdjustPolicy(QComboBox::AdjustToMinimumContentsLengthWithIcon);
-    combo->setMinimumContentsLength(1);
-    return combo;
+    QWidget* const view = MakeView(keys, face);
+    view->setFocusPolicy(Qt::StrongFocus);
+    return view;
 }
 
 QWidget* MakeLine(QWidget* face)
@@ -109,11 +93,11 @@ QWidget* MakeWidget(const SkinChild& child, const CSkin& skin, const CLeftKeys& 
     if (child.kind == "text")
         return MakeTitle(face);
     if (child.kind == "view")
-        return MakeView(keys, face);
+        return MakeFocusableView(keys, face);
     if (child.kind == "bar")
         return new CPlaybar(face);
     if (child.kind == "combo")
-        return MakeCombo(face);
+        return new CMapField(face);
     if (child.kind == "line")
         return MakeLine(face);
     return new CFaceButton(child, skin, face);
@@ -122,7 +106,7 @@ QWidget* MakeWidget(const SkinChild& child, const CSkin& skin, const CLeftKeys& 
 } // namespace
 
 CFaceButton::CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* face)
-    : QPushButton(face), m_kFirst(skin.Icon(child.icon)),
+    : CPushButton(face), m_kFirst(skin.Icon(child.icon)),
       m_kSecond(child.secondIcon.empty() ? m_kFirst : skin.Icon(child.secondIcon))
 {
     // A blank keeps the text away from the picture.
@@ -131,14 +115,6 @@ CFaceButton::CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* fac
     setCheckable(child.kind == "toggle");
     setIconSize(kIconSize);
     SetFace(0);
-}
-
-void CFaceButton::keyPressEvent(QKeyEvent* event)
-{
-    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
-        click();
-    else
-        QPushButton::keyPressEvent(event);
 }
 
 QWidget* MakeFaceChild(const SkinChild& child, const CSkin& skin, const CLeftKeys& keys, QWidget* face)

@@ -1,24 +1,20 @@
 #pragma once
 
+#include "CPushButton.h"
 #include "CSkin.h"
-
-#include <QPushButton>
 
 namespace gw {
 
 class CLeftKeys;
 
-/// A button of the face with one picture per state. Enter clicks it, because the space bar plays.
-class CFaceButton : public QPushButton
+/// A button of the face with one picture per state.
+class CFaceButton : public CPushButton
 {
 public:
     CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* face);
 
     /// Shows the first picture for 0, otherwise the second.
     void SetFace(int face) { setIcon(face == 0 ? m_kFirst : m_kSecond); }
-
-protected:
-    void keyPressEvent(QKeyEvent* event) override;
 
 private:
     QIcon m_kFirst;

@@ -125,7 +125,7 @@ int WrappedHeight(const QWidget& widget, int width, const QString& text)
 } // namespace
 
 CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& text, EButtons buttons,
-                         const QString& details, EDetails shown)
+                         const BoxExtras& extras)
     : QDialog(owner), m_eEscape(RowsOf(buttons).back().answer)
 {
     Named(this, "messageBox", caption);
@@ -133,23 +133,25 @@ CMessageBox::CMessageBox(QWidget* owner, const QString& caption, const QString& 
     auto* top = new QHBoxLayout;
     top->setSpacing(kDialogMargin);
     top->addWidget(MakeIcon(buttons != EButtons::OK), 0, Qt::AlignTop);
-    top->addWidget(MakeText(text), 1, Qt::AlignLeft | Qt::AlignVCenter);
+    top->addWidget(MakeText(text, "text"), 1, Qt::AlignLeft | Qt::AlignVCenter);
     auto* layout = new QVBoxLayout(this);
     layout->setContentsMargins(kDialogMargin, kDialogMargin, kDialogMargin, kDialogMargin);
     layout->setSpacing(kDialogMargin);
     layout->setSizeConstraint(QLayout::SetFixedSize); // resizes with the details
     layout->addLayout(top);
     layout->addStrut(kLeastWidth);
-    if (!details.isEmpty())
-        layout->addWidget(MakeDetails(details));
-    layout->addLayout(MakeButtons(buttons, !details.isEmpty()));
-    if (m_pkFold && shown == EDetails::Unfolded)
+    if (!extras.summary.empty())
+        layout->addWidget(MakeText(ToQString(extras.summary), "summary"));
+    if (!extras.details.empty())
+        layout->addWidget(MakeDetails(ToQString(extras.details)));
+    layout->addLayout(MakeButtons(buttons, extras));
+    if (m_pkFold && extras.shown == EDetails::Unfolded)
         m_pkFold->setChecked(true);
 }
 
-QWidget* CMessageBox::MakeText(const QString& text)
+QWidget* CMessageBox::MakeText(const QString& text, const char* name)
 {
-    auto* label = Named(new QLabel(this), "text", text);
+    auto* label = Named(new QLabel(this), name, text);
     label->setTextFormat(Qt::PlainText);
     label->setText(Breakable(text));
     label->setWordWrap(true);
@@ -175,7 +177,7 @@ QWidget* CMessageBox::MakeDetails(const QString& details)
     return m_pkDetails;
 }
 
-QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
+QLayout* CMessageBox::MakeButtons(EButtons buttons, const BoxExtras& extras)
 {
     auto* layout = new QHBoxLayout;
     layout->addStretch();
@@ -189,9 +191,27 @@ QLayout* CMessageBox::MakeButtons(EButtons buttons, bool hasDetails)
         connect(button, &QPushButton::clicked, this, [this, &row] { done(static_cast<int>(row.answer)); });
         layout->addWidget(button);
     }
-    if (hasDetails)
+    AddOffers(*layout, extras.offers);
+    if (!extras.details.empty())
         AddDetailsButtons(*layout);
     return layout;
+}
+
+// To the left of the answers.
+void CMessageBox::AddOffers(QBoxLayout& layout, const std::vector<std::string>& offers)
+{
+    for (int index = 0; index < static_cast<int>(offers.size()); ++index)
+    {
+        const QString text = ToQString(offers[static_cast<size_t>(index)]);
+        auto* button = Named(new QPushButton(this), "offer", text);
+        button->setText(QString(text).replace(QLatin1Char('&'), QStringLiteral("&&")));
+        button->setAutoDefault(false);
+        connect(button, &QPushButton::clicked, this, [this, index] {
+            m_iOffer = index;
+            reject();
+        });
+        layout.insertWidget(1 + index, button);
+    }
 }
 
 // To the left of the other buttons, but after them in Tab order.
@@ -245,10 +265,13 @@ void CMessageBox::reject()
 }
 
 EAnswer RunMessageBox(QWidget* owner, const std::string& caption, const std::string& text, EButtons buttons,
-                      const std::string& details, EDetails shown)
+                      const BoxExtras& extras, int* offer)
 {
-    CMessageBox box(owner, ToQString(caption), ToQString(text), buttons, ToQString(details), shown);
-    return box.Run();
+    CMessageBox box(owner, ToQString(caption), ToQString(text), buttons, extras);
+    const EAnswer answer = box.Run();
+    if (offer)
+        *offer = box.ChosenOffer();
+    return answer;
 }
 
 } // namespace gw

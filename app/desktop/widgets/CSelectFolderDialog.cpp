@@ -108,6 +108,13 @@ CSelectFolderDialog::CSelectFolderDialog(QWidget* owner, const FileDialogSetup& 
     layout->addWidget(MakeList());
     if (!setup.filter.empty())
         layout->addLayout(MakeFilterRow(setup.filter));
+    if (!setup.note.empty())
+    {
+        auto* const note = Named(new QLabel(ToQString(setup.note), this), "note", ToQString(setup.note));
+        note->setTextFormat(Qt::PlainText);
+        note->setWordWrap(true);
+        layout->addWidget(note);
+    }
     layout->addSpacing(kDialogSpacing);
     layout->addLayout(MakeButtons());
     resize(kWidth, m_pkFilter ? kHeight + kFilterHeight : kHeight);

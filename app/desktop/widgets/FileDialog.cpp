@@ -35,6 +35,8 @@ std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode
     dialog.setNameFilters(NameFilters(setup.filter));
     if (!setup.initialFolder.empty())
         dialog.setDirectory(ToQString(setup.initialFolder));
+    if (!setup.fileName.empty())
+        dialog.selectFile(ToQString(setup.fileName));
     if (dialog.exec() != QDialog::Accepted || dialog.selectedFiles().isEmpty())
         return std::nullopt;
     return ToUtf8(dialog.selectedFiles().first());

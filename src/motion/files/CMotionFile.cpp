@@ -97,6 +97,7 @@ bool CMotionFile::Load(const std::string& path)
     {
         const auto stream = row->make();
         stream->boneMeshes = boneMeshes;
+        stream->lines.SetProgress(progress_);
         const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
         m_kRecord = stream->m_kRecord;
         if (!stream->IsSourceWhole())

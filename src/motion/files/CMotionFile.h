@@ -7,8 +7,10 @@
 #include "HTRPose.h"
 #include "MotionNode.h"
 
+#include <cstddef>
 #include <functional>
 #include <string>
+#include <utility>
 
 namespace gw {
 
@@ -31,6 +33,9 @@ public:
     /// unchanged. For any other extension, returns true if a motion is already loaded, otherwise false. The
     /// tree is left at time 0.
     virtual bool Load(const std::string& path);
+    /// Sets a function that Load calls from time to time with the number of bytes read and the total. It may
+    /// throw to end the loading; the trees are then unchanged.
+    void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
     /// Writes an HTR file with frameScale times as many frames. Returns false for other extensions and on
     /// failure.
     virtual bool Save(const std::string& path, float frameScale);
@@ -69,6 +74,8 @@ protected:
 
 private:
     bool SaveBy(const std::function<bool(TKHTRStream&)>& save);
+
+    std::function<void(size_t, size_t)> progress_;
 };
 
 /// Activates or deactivates every control below a node. An inactive track sets its node to the rest pose.

@@ -7,6 +7,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kForgetInterval = size_t{8} << 20;
+constexpr size_t kReportInterval = size_t{1} << 18;
 
 // Returns the characters before a line feed, without its carriage return.
 std::string_view CutLineEnd(std::string_view text, size_t feed)
@@ -30,6 +31,7 @@ void CTextLines::Close()
     m_kFile.Close();
     m_kNow = m_kBefore = {};
     m_uiForgotten = 0;
+    m_uiReported = 0;
 }
 
 void CTextLines::StepBack()
@@ -39,6 +41,11 @@ void CTextLines::StepBack()
 
 void CTextLines::ForgetRead()
 {
+    if (m_kNow.m_uiOffset - m_uiReported < kReportInterval)
+        return;
+    m_uiReported = m_kNow.m_uiOffset;
+    if (progress_)
+        progress_(m_uiReported, ByteCount());
     if (m_kNow.m_uiOffset - m_uiForgotten < kForgetInterval)
         return;
     m_uiForgotten = m_kNow.m_uiOffset;

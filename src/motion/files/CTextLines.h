@@ -4,8 +4,10 @@
 #include "CMappedFile.h"
 
 #include <cstddef>
+#include <functional>
 #include <string>
 #include <string_view>
+#include <utility>
 
 namespace gw {
 
@@ -36,8 +38,10 @@ public:
     size_t ByteCount() const { return m_kFile.Text().size(); }
     /// See CMappedFile.
     bool IsWhole() const { return m_kFile.IsWhole(); }
-    /// Releases the memory of the lines read so far, if that is worth a system call.
+    /// Releases the memory of the lines read so far, if that is worth a system call, and reports progress.
     void ForgetRead();
+    /// Sets a function that ForgetRead calls from time to time with the number of bytes read and the total.
+    void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
 
 private:
     struct Cursor
@@ -53,6 +57,8 @@ private:
     Cursor m_kNow;
     Cursor m_kBefore;
     size_t m_uiForgotten = 0;
+    size_t m_uiReported = 0;
+    std::function<void(size_t, size_t)> progress_;
 };
 
 /// Returns a word or line of a file, shortened for a failure record.

@@ -29,6 +29,7 @@ void CScriptedWindow::Notify(const Notice& notice)
 
 void CScriptedWindow::SetChildText(std::string_view child, const std::string& text)
 {
+    m_kTexts[std::string(child)] = text;
     if (child == "#title")
         m_kTitles.push_back(text);
 }
@@ -55,12 +56,14 @@ std::optional<std::string> CScriptedWindow::AskOpenFile(const FileDialogSetup& s
 std::optional<std::string> CScriptedWindow::AskSaveFile(const FileDialogSetup& setup)
 {
     m_kCalls.push_back("save *." + setup.defaultExtension);
+    m_kAsked = setup;
     return saveAnswer;
 }
 
 std::optional<FolderChoice> CScriptedWindow::AskFolder(const FileDialogSetup& setup)
 {
     m_kCalls.push_back("folder in " + setup.initialFolder);
+    m_kAsked = setup;
     return folderAnswer;
 }
 

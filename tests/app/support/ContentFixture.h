@@ -40,8 +40,10 @@ public:
     std::optional<FolderChoice> AskFolder(const FileDialogSetup& setup) override;
     bool IsKeyDown(EKey key) const override { return m_kKeys.contains(key); }
     void Notify(const Notice& notice) override;
+    bool ShowsFindings() const override { return m_bShowsFindings; }
     void StayPainted() override { onPaint(); }
     bool IsProgressDue() override { return m_bProgressDue; }
+    bool IsCancelRequested() const override { return m_bCancel; }
     void BeginWaitCursor() override { ++m_iWaits; }
     void EndWaitCursor() override { --m_iWaits; }
     void PostCloseRequest() override { m_kCalls.emplace_back("close"); }
@@ -95,6 +97,10 @@ public:
     int m_iScrollValue = 0;
     bool m_bButtonState = false;
     bool m_bProgressDue = false;
+    bool m_bCancel = false;
+    bool m_bShowsFindings = false;
+    FileDialogSetup m_kAsked; ///< of the last file or folder dialog
+    std::map<std::string, std::string> m_kTexts; ///< last texts of children, by name
 };
 
 /// Settings in memory, and folders data/ and docs/ in a temporary folder.
