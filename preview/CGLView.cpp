@@ -3,14 +3,19 @@
 
 #include "CGLView.h"
 
+#include "FindHip.h"
+
 #include <algorithm>
+#include <cmath>
 
 namespace gw {
 
 namespace {
 
-constexpr float kEyeDistance = 2.5f; // radii between eye and center: the whole sphere fits into 45 degrees
-constexpr float kDragStep = 0.005f;  // radii per pixel of mouse movement
+constexpr float kEyeDistance = 2.5f;  // radii between eye and center: the whole sphere fits into 45 degrees
+constexpr float kDragStep = 0.005f;   // radii per pixel of mouse movement
+constexpr double kDollyShare = 0.1;   // of the distance, per notch of the mouse wheel
+constexpr float kFarthestEye = 50.0f; // radii; the wheel does not go beyond
 
 } // namespace
 
@@ -27,6 +32,7 @@ void CGLView::SetScene(CNode* root, float frameStep, float lastFrame)
     {
         m_kMeshes.Clear();
         m_spkScene = root;
+        m_spkHip = root ? FindHip(*root) : nullptr;
     }
     FrameAll();
     Repaint();
@@ -136,6 +142,44 @@ void CGLView::MouseMove(int x, int y, DragKeys keys)
         m_kCamera.m_kEye.z = std::max(m_kCamera.m_kEye.z + dy, 0.0f);
     else if (!keys.leftShift)
         m_kPan = m_kPan + Vec3{-dx, dy, 0.0f};
+    Repaint();
+}
+
+void CGLView::Dolly(double notches)
+{
+    if (!m_spkScene)
+        return;
+    Vec3& eye = m_kCamera.m_kEye;
+    const float distance = eye.z - m_kCamera.m_kLookAt.z;
+    const float farthest = kFarthestEye * m_spkScene->m_kBound.m_fRadius;
+    const auto scaled = static_cast<float>(distance * std::pow(1.0 - kDollyShare, notches));
+    eye.z = std::max(m_kCamera.m_kLookAt.z + std::min(scaled, std::max(distance, farthest)), 0.0f);
+    Repaint();
+}
+
+std::string CGLView::BoneAt(const ViewPosition& at)
+{
+    if (!m_spkScene)
+        return {};
+    return PickBone(m_kMeshes.Of(*m_spkScene), CEyeSpace(m_kCamera, ShownPan()), at);
+}
+
+// The figure's depth is kept as well: a figure that walks toward the viewer keeps its size.
+Vec3 CGLView::ShownPan() const
+{
+    if (!m_bFollowing || !m_spkHip)
+        return m_kPan;
+    const CEyeSpace space(m_kCamera);
+    const Vec3 middle = space.PlaceOf(m_kCamera.m_kLookAt);
+    return m_kPan + middle - space.PlaceOf(m_spkHip->m_kWorldMatrix.Translation());
+}
+
+void CGLView::SetFollow(bool on)
+{
+    if (on == m_bFollowing)
+        return;
+    m_kPan = on ? kVec3Zero : ShownPan();
+    m_bFollowing = on;
     Repaint();
 }
 

@@ -5,6 +5,7 @@
 #include "CMeshList.h"
 #include "CMotionView.h"
 #include "CNode.h"
+#include "PickBone.h"
 
 #include <cstdint>
 #include <functional>
@@ -49,6 +50,8 @@ public:
     float GetLastFrame() const override { return m_fLastFrame; }
     void SetHighlight(const std::string& boneName) override { m_kHighlight = boneName; }
     void Repaint() override;
+    void SetFollow(bool on) override;
+    bool IsFollowing() const { return m_bFollowing; }
 
     /// Sets the function that Repaint calls, which should schedule a redraw.
     void SetRepaint(std::function<void()> repaint) { repaint_ = std::move(repaint); }
@@ -63,6 +66,13 @@ public:
     /// nothing moves.
     void MouseMove(int x, int y, DragKeys keys);
     bool IsDragging() const { return m_bDragging; }
+    /// Moves the eye toward the point that it looks at, by a tenth of the distance per notch of the wheel;
+    /// negative numbers move it away. The eye's Z never falls below 0.
+    void Dolly(double notches);
+    /// Returns the bone that is drawn at a position, or empty.
+    std::string BoneAt(const ViewPosition& at);
+    /// Returns the pan with which the scene is drawn: m_kPan, and what keeps a followed figure in the middle.
+    Vec3 ShownPan() const;
 
     /// Chooses and sets the format of the surface, before it exists. Returns false, after reporting it, if
     /// there is no such format. A view without a surface does not need one.
@@ -82,6 +92,7 @@ private:
     void GoTo(float time);
 
     Ref<CNode> m_spkScene;
+    Ref<CNode> m_spkHip; // of the scene
     CMeshList m_kMeshes;
     CDrawList m_kDrawList;
     std::function<void()> repaint_;
@@ -92,6 +103,7 @@ private:
     int m_iLastY = 0;
     bool m_bDragging = false;
     bool m_bPlaying = false;
+    bool m_bFollowing = false;
 };
 
 } // namespace gw

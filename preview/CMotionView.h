@@ -37,6 +37,10 @@ public:
     /// Sets the bone to draw in another color by its exact name; empty for none.
     virtual void SetHighlight(const std::string& boneName) = 0;
     virtual void Repaint() = 0;
+    /// Keeps the figure's hip in the middle of the view, or stops doing so where the figure is.
+    virtual void SetFollow(bool on) = 0;
+    /// Shows a short text in a corner of the view; empty for none.
+    virtual void SetNote(const std::string&) {}
 };
 
 } // namespace gw

@@ -7,7 +7,7 @@ namespace gw {
 GLScene SceneOf(CGLView& view)
 {
     const CCamera& camera = view.m_kCamera;
-    return {view.DrawScene().Ends(), view.m_kPan, camera.m_kEye, camera.m_kLookAt, camera.m_kUp};
+    return {view.DrawScene().Ends(), view.ShownPan(), camera.m_kEye, camera.m_kLookAt, camera.m_kUp};
 }
 
 } // namespace gw

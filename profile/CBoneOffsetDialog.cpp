@@ -3,6 +3,7 @@
 #include "Numbers.h"
 
 #include <cstdlib>
+#include <utility>
 
 namespace gw {
 
@@ -18,7 +19,8 @@ constexpr std::array<std::array<size_t, 2>, 3> kOtherAxes{
 
 } // namespace
 
-CBoneOffsetDialog::CBoneOffsetDialog(const RowNumbers& numbers) : m_kNumbers(numbers)
+CBoneOffsetDialog::CBoneOffsetDialog(const RowNumbers& numbers, std::string source, std::string target)
+    : m_kNumbers(numbers), m_kSource(std::move(source)), m_kTarget(std::move(target))
 {
     for (size_t axis = 0; axis < m_kRotationText.size(); ++axis)
         m_kRotationText[axis] = std::to_string(numbers.rotation[axis]);

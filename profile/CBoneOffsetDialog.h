@@ -16,9 +16,13 @@ public:
     /// Entries of each axis box, in order.
     static constexpr std::array<std::string_view, 6> kAxisEntries{"X", "-X", "Y", "-Y", "Z", "-Z"};
 
-    explicit CBoneOffsetDialog(const RowNumbers& numbers = {});
+    /// Edits the numbers of a row with these two bones.
+    explicit CBoneOffsetDialog(const RowNumbers& numbers = {}, std::string source = {},
+                               std::string target = {});
 
     const RowNumbers& Numbers() const { return m_kNumbers; }
+    const std::string& Source() const { return m_kSource; }
+    const std::string& Target() const { return m_kTarget; }
 
     /// Returns the text of a rotation field.
     const std::string& RotationText(int axis) const { return m_kRotationText[static_cast<size_t>(axis)]; }
@@ -34,6 +38,8 @@ public:
 
 private:
     RowNumbers m_kNumbers;
+    std::string m_kSource;
+    std::string m_kTarget;
     std::array<std::string, 3> m_kRotationText;
 };
 

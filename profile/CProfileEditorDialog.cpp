@@ -305,7 +305,8 @@ bool CProfileEditorDialog::EditBoneOffset()
     const int row = m_kRows.NextSelected(CMapRowTable::kNone);
     if (row == CMapRowTable::kNone)
         return false;
-    CBoneOffsetDialog dialog(m_kRows.Numbers(row));
+    CBoneOffsetDialog dialog(m_kRows.Numbers(row), m_kRows.Text(row, kSourceColumn),
+                             m_kRows.Text(row, kTargetColumn));
     if (!owner_.RunBoneOffset(dialog) || row >= m_kRows.RowCount())
         return false;
     if (m_kRows.Numbers(row) == dialog.Numbers())

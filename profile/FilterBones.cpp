@@ -16,7 +16,8 @@ std::vector<int> FilterBones(const CBoneTree& tree, std::string_view text)
         if (LowerCase(tree.Text(item)).find(part) != std::string::npos)
             bones.push_back(item);
     }
-    std::stable_partition(bones.begin(), bones.end(), [&](int item) { return !tree.IsMapped(item); });
+    const auto rank = [&](int item) { return item == tree.Find(text) ? 0 : tree.IsMapped(item) ? 2 : 1; };
+    std::ranges::stable_sort(bones, {}, rank);
     return bones;
 }
 

@@ -8,8 +8,8 @@ namespace gw {
 
 class CBoneTree;
 
-/// Returns the bones whose name contains a text, ignoring case: unmapped bones first, each part in tree
-/// order. An empty text matches every name.
+/// Returns the bones whose name contains a text, ignoring case: one with exactly this name, then
+/// unmapped bones, then mapped ones, each in tree order. An empty text matches every name.
 std::vector<int> FilterBones(const CBoneTree& tree, std::string_view text);
 /// Returns the bones above a bone, starting at the root, as "Hips / Spine"; empty for a bone at the top of
 /// the tree.

@@ -14,6 +14,7 @@ namespace gw {
 
 class CBoneOffsetDialog;
 class CCntComboExControl;
+struct MotionMarks;
 
 /// The initial state of an open or save dialog. A filter consists of pairs of text and pattern, each followed
 /// by "|", with "||" at the end.
@@ -102,6 +103,13 @@ public:
     /// Starts a timer that runs until it is killed; a running timer gets the new period.
     virtual void SetTimer(int, int) {}
     virtual void KillTimer(int) {}
+
+    // Marks under the bar
+
+    /// Marks are being measured: call UpdateMarks from time to time until it returns false.
+    virtual void WatchMarks() {}
+    /// Replaces the marks on display; none if their frame count is 0.
+    virtual void ShowMarks(const MotionMarks&) {}
 
     // The profile editor's dialog, which displays the editor's model
 

@@ -39,8 +39,8 @@ CGaitConvertContent::~CGaitConvertContent() = default;
 
 bool CGaitConvertContent::OnInitContent()
 {
-    m_pkSourceView = window_.CreateView("#cnt1");
-    m_pkResultView = window_.CreateView("#cnt2");
+    m_pkSourceView = window_.CreateView(kSourceViewChild);
+    m_pkResultView = window_.CreateView(kResultViewChild);
     const int fontSize = ParseInt(Message(kListFontSizeMessage));
     m_pkProfileCombo = &window_.CreateComboEx("#format", "pull", fontSize);
     m_pkProfileCombo->SetFont(Message(kListFontMessage), fontSize, fontSize);
@@ -49,6 +49,7 @@ bool CGaitConvertContent::OnInitContent()
     m_pkProfileDialog->SetNamesInUse(&m_kProfileNames);
     m_pkProfile = m_pkProfileDialog.get();
     window_.SetChildScrollRange("|playbar", 0, kScrollRange);
+    RestoreFollow();
     UpdateControls();
     return m_pkSourceView && m_pkResultView;
 }
@@ -161,6 +162,7 @@ bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& pat
 // Shows the loaded source, loads the target skeleton twice, and passes all three to the profile editor.
 void CGaitConvertContent::ShowSource()
 {
+    ClearMarks();
     CNode* const root = SourceRoot();
     m_kOrigin.reset();
     m_kResultFile.clear();

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CConversion.h"
+#include "CMarksMeter.h"
 #include "CMapFits.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
@@ -34,6 +35,10 @@ class CProfileEditorDialog;
 inline constexpr int kScrollRange = 256;
 /// The period of the clock that advances both views by one frame.
 inline constexpr int kClockMilliseconds = 17;
+
+/// The children that show the motions.
+inline constexpr const char* kSourceViewChild = "#cnt1";
+inline constexpr const char* kResultViewChild = "#cnt2";
 
 /// The conversion from opening a source to saving the result, as a state machine without a window: commands
 /// arrive by child name, requests go out through the two ports. Operations that return a number return 0 on
@@ -83,6 +88,24 @@ public:
     void ChildMouseDown(std::string_view child);
     void ChildMouseUp(std::string_view child);
     void ChildScroll(std::string_view child, int value);
+
+    // The views
+
+    /// Keeps the figures in the middle of both views, or not, and remembers that in the settings.
+    void SetFollow(bool on);
+    bool IsFollowing() const { return m_bFollows; }
+    /// Selects the bone that was clicked in a view, in the editor's tree.
+    void ClickBone(std::string_view child, const std::string& bone);
+
+    // Marks: planted feet and worst frames of the result, which are measured after each conversion
+
+    /// Shows the marks in the window if they are measured by now. Returns whether that is still going on.
+    bool UpdateMarks();
+    const MotionMarks& Marks() const { return m_kMarks; }
+    /// Stops at a frame of the source, and at the same moment of the result.
+    void GoToFrame(int frame);
+    /// Stops at the next of the worst frames; after the last one, at the first.
+    void GoToNextWorst();
 
     // Profiles
 
@@ -216,6 +239,14 @@ private:
     void ShowHighlights();
     void ShowChoices();
 
+    // ViewCommands.cpp
+    void RestoreFollow();
+
+    // Marks.cpp
+    void StartMarks(CNode& driving);
+    void ClearMarks();
+    void ShowWorstFrame();
+
     // Commands.cpp
     void ForViews(void (CMotionView::*operation)());
     template <auto Operation>
@@ -259,6 +290,7 @@ private:
     std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                           ///< last text passed to SetTitle
     ConversionChoices m_kChoices;
+    bool m_bFollows = false;                ///< both views keep the figure in the middle
     CMapFits m_kFits;                       ///< of the installed bone maps to the open source
     std::string m_kUpAxis;                  ///< of the source, if it is not Y
     std::string m_kMendable;                ///< the file read last, if it has faults that can be repaired
@@ -271,6 +303,8 @@ private:
     bool m_bConverted = false;              ///< the open source has been converted
     bool m_bSaved = true;                   ///< the result has been saved, or there is none
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's
+    MotionMarks m_kMarks;                   ///< of the result, once they are measured
+    CMarksMeter m_kMarksMeter;
     CFailureRecord m_kWriteRecord;          ///< failures of the last WriteResult
 };
 

@@ -32,13 +32,13 @@ enum EFact : uint32_t
     kRemovable = 1 << 14,   // it is a custom profile with a listed name
 };
 
-struct Row
+struct ControlRow
 {
     std::string_view m_kChild;
     uint32_t m_uiNeeds;
 };
 
-constexpr Row kControls[] = {
+constexpr ControlRow kControls[] = {
     {"play",     kSource                       },
     {"stop",     kSource | kSourcePlays        },
     {"back",     kSource | kSourceMoved        },
@@ -137,7 +137,7 @@ uint32_t CGaitConvertContent::ProfileFacts() const
 void CGaitConvertContent::UpdateControls()
 {
     const uint32_t facts = ControlFacts();
-    for (const Row& row : kControls)
+    for (const ControlRow& row : kControls)
         window_.EnableChild(row.m_kChild, (facts & row.m_uiNeeds) == row.m_uiNeeds);
     const bool plays = (facts & kSourcePlays) != 0;
     window_.SetChildFace("play", plays ? 1 : 0);
@@ -147,6 +147,7 @@ void CGaitConvertContent::UpdateControls()
     window_.SetChildText("#frame", PlaceText(m_pkSourceView.get()));
     ShowHighlights();
     ShowChoices();
+    ShowWorstFrame();
     ShowCaptions();
 }
 

@@ -32,6 +32,7 @@ int CGaitConvertContent::RunBatch(const std::string& initialFolder)
     const std::vector<std::string> names = FilesInFolder(folder, BatchSource(job));
     if (names.empty())
         return 0;
+    ClearMarks();
     EBatchStep step = EBatchStep::Done;
     size_t finished = 0;
     while (finished < names.size() && step == EBatchStep::Done)

@@ -15,6 +15,7 @@ int CGaitConvertContent::ConvertMotion()
     const CWaitCursor wait(window_);
     ForgetFailedSave();
     ForViews(&CMotionView::Stop);
+    ClearMarks();
     const CMotionFile before(m_kResultMotion);
     ReloadResult();
     if (m_pkProfile)
@@ -77,6 +78,8 @@ bool CGaitConvertContent::Retarget(bool heedsShift)
     m_kOrigin = {MapName(), m_pkProfileDialog->Rows(), m_kChoices, useLegs};
     m_kResultFile.clear();
     ShowTitle(m_kTitle);
+    if (heedsShift) // one conversion, not one of many
+        StartMarks(conversion.Aligned() ? *conversion.Aligned() : *SourceRoot());
     return true;
 }
 

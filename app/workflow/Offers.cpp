@@ -12,6 +12,7 @@
 #include "NewProfilePath.h"
 #include "Paths.h"
 #include "StringTable.h"
+#include "SystemError.h"
 #include "Text.h"
 #include "UpAxis.h"
 
@@ -153,7 +154,7 @@ bool CGaitConvertContent::SaveNewMap(const std::string& path, const std::string&
     CSafeFile file;
     if (file.Open(path) && file.Write(text) && file.Commit())
         return true;
-    window_.Notify(MakeNotice(path, {EFailure::WriteError}));
+    window_.Notify(MakeNotice(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()}));
     window_.ShowMessageBox(kOwnMessage, "The bone map cannot be written.", EButtons::OK);
     return false;
 }

@@ -158,6 +158,7 @@ void CPerson::WillAnswer(const char* button)
         auto* const found = dialog.findChild<QPushButton*>(name);
         if (!found)
             return false;
+        m_pkAsker = dialog.parentWidget()->window();
         const auto* text = dialog.findChild<QLabel*>(QStringLiteral("text"));
         m_kBoxes << (text ? text->accessibleName() : QString());
         const auto* details = dialog.findChild<QPlainTextEdit*>(QStringLiteral("detailsText"));

@@ -9,11 +9,11 @@
 #include "TempFolder.h"
 
 #include <QImage>
+#include <QPointer>
 #include <QString>
+#include <QWidget>
 #include <memory>
 #include <string>
-
-class QWidget;
 
 namespace gw {
 
@@ -69,8 +69,9 @@ public:
     void WillChooseFolder(const std::string& folder, int filter);
     /// Texts of the message boxes so far.
     QStringList m_kBoxes;
-    QString m_kDetails;       ///< of the last one
-    bool m_bUnfolded = false; ///< whether they were visible from the start
+    QPointer<QWidget> m_pkAsker; ///< window of the last one
+    QString m_kDetails;          ///< of the last one
+    bool m_bUnfolded = false;    ///< whether they were visible from the start
 
     void Wait(int milliseconds);
 

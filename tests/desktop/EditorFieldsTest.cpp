@@ -107,24 +107,21 @@ TEST_F(EditorFields, EscapeCommitsAndClosesAndTheToggleComesUp)
 {
     m_kWindow.m_bButtonState = true;
     Type(kFrameRateField, "60");
+    const auto isKeyboardFree = [] { return !QGuiApplication::focusWindow(); };
     QTest::keyClick(QApplication::focusWidget(), Qt::Key_Escape);
-    Settle();
+    EXPECT_TRUE(WaitUntil(isKeyboardFree));
     EXPECT_FALSE(m_kEditor.isVisible());
     EXPECT_FALSE(Model().IsVisible());
     EXPECT_FALSE(m_kWindow.m_bButtonState);
     EXPECT_EQ(Model().GetFrameRate(), 60);
     Toggle(true);
     EXPECT_EQ(Field(kFrameRateField), "60") << "its state is the profile, seen or not";
-}
-
-TEST_F(EditorFields, EscapeClosesFromTreesAndListToo)
-{
     for (const int id : {kSourceTree, kMapRowList, kRemoveAllButton})
     {
         Child<QWidget>(id).setFocus();
         Press(Qt::Key_Escape);
         EXPECT_FALSE(m_kEditor.isVisible()) << id;
-        EXPECT_TRUE(WaitUntil([] { return !QGuiApplication::focusWindow(); })) << "the keyboard is free";
+        EXPECT_TRUE(WaitUntil(isKeyboardFree));
         Toggle(true);
     }
 }

@@ -132,27 +132,4 @@ TEST_F(EditorRows, TheListScrollsNeitherAtAClickNorAtARemoval)
     EXPECT_EQ(Rows().size(), 201u);
 }
 
-TEST_F(EditorRows, TheFilterShowsWhatIsStillToBeMappedFirst)
-{
-    Use("hip x LowerTorso 0\nlThigh x LThigh 0\n");
-    ClickBone(kSourceTree, "rThigh");
-    Press(Qt::Key_F, Qt::ControlModifier);
-    QTest::keyClicks(QApplication::focusWidget(), QStringLiteral("THIGH"));
-    Settle();
-    EXPECT_THAT(Bones(kSourceTree), ElementsAre("rThigh", "lThigh"));
-    EXPECT_THAT(Bones(kTargetTree), ElementsAre("RThigh", "LThigh"));
-    EXPECT_EQ(SelectedBone(kSourceTree), "rThigh");
-    ClickBone(kTargetTree, "RThigh");
-    Click(kAddToMapButton);
-    EXPECT_THAT(Bones(kTargetTree), ElementsAre("LThigh", "RThigh"))
-        << "mapped as well now: the tree's order";
-
-    Press(Qt::Key_F, Qt::ControlModifier);
-    Press(Qt::Key_Escape);
-    EXPECT_TRUE(m_kEditor.isVisible());
-    EXPECT_FALSE(Child<QWidget>(QStringLiteral("filterLine")).isVisible());
-    EXPECT_EQ(Bones(kSourceTree).size(), 7u);
-    EXPECT_EQ(SelectedBone(kTargetTree), "RThigh");
-}
-
 } // namespace gw

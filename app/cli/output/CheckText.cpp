@@ -3,9 +3,9 @@
 #include "CJsonWriter.h"
 #include "CompareText.h"
 #include "ConvertedMotion.h"
+#include "FaultWords.h"
 #include "KeyFigures.h"
 #include "Text.h"
-#include "WorstFrames.h"
 
 #include <cstdio>
 
@@ -13,32 +13,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kWorstFrames = 3;
 constexpr const char* kIndent = "    ";
-
-struct FaultWords
-{
-    const char* name; // identifier for programs
-    const char* text;
-    const char* unit;
-};
-
-// Indexed by EFrameFault.
-constexpr FaultWords kFaults[] = {
-    {"direction",  "mean error of the main bones", "deg"},
-    {"trunk",      "trunk error",                  "deg"},
-    {"kneePop",    "knee pop beyond the source's", "deg"},
-    {"ankleSlide", "added slide of the ankle",     "mm" },
-    {"toeSlide",   "added slide of the toe",       "mm" },
-    {"heldSole",   "held sole off the floor by",   "mm" },
-    {"handGap",    "hand gap",                     "mm" },
-    {"handDepth",  "hand below the floor by",      "mm" },
-};
-
-const FaultWords& WordsOf(const WorstFrame& worst)
-{
-    return kFaults[static_cast<size_t>(worst.fault)];
-}
 
 void PrintParts(const std::vector<PartMeasures>& parts)
 {
@@ -59,7 +34,7 @@ void PrintWorst(const std::vector<WorstFrame>& frames)
 {
     for (const WorstFrame& worst : frames)
     {
-        const FaultWords& words = WordsOf(worst);
+        const FaultWords& words = WordsOf(worst.fault);
         std::printf("%sworst: frame %d, %s %.2f %s (%s)\n", kIndent, worst.frame, words.text, worst.amount,
                     words.unit, Printable(worst.target).c_str());
     }
@@ -89,7 +64,7 @@ void WriteWorst(CJsonWriter& json, const std::vector<WorstFrame>& frames)
     {
         json.BeginObject();
         json.Key("frame").Integer(worst.frame);
-        json.Key("fault").Text(WordsOf(worst).name);
+        json.Key("fault").Text(WordsOf(worst.fault).name);
         json.Key("amount").Number(static_cast<float>(worst.amount));
         json.Key("target").Text(worst.target);
         json.Key("source").Text(worst.source);

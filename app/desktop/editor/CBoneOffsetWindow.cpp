@@ -3,9 +3,11 @@
 #include "CBoneOffsetWindow.h"
 
 #include "CBoneOffsetDialog.h"
+#include "CElidedLabel.h"
 #include "CFieldEdit.h"
 #include "CGaitConvertContent.h"
 #include "CMapRowTable.h"
+#include "PairText.h"
 #include "QtText.h"
 
 #include <QComboBox>
@@ -50,11 +52,21 @@ CBoneOffsetWindow::CBoneOffsetWindow(const CGaitConvertContent& content, CBoneOf
     setWindowTitle(QStringLiteral("GaitTool (Bone Offset)"));
     auto* const layout = new QVBoxLayout(this);
     layout->setSizeConstraint(QLayout::SetFixedSize);
+    layout->addWidget(MakePair());
     layout->addLayout(MakeNumbers(content));
     layout->addLayout(MakeButtons());
     ShowAxes();
     m_pkRotation[0]->setFocus();
     m_pkRotation[0]->selectAll();
+}
+
+QWidget* CBoneOffsetWindow::MakePair()
+{
+    auto* const pair = new CElidedLabel(this);
+    pair->setObjectName(QStringLiteral("offsetPair"));
+    pair->setProperty("kind", QStringLiteral("text"));
+    pair->ShowText(PairText(dialog_.Source(), dialog_.Target()));
+    return pair;
 }
 
 QLayout* CBoneOffsetWindow::MakeNumbers(const CGaitConvertContent& content)

@@ -23,6 +23,7 @@ public:
 private:
     static constexpr int kAxisCount = 3;
 
+    QWidget* MakePair();
     QLayout* MakeNumbers(const CGaitConvertContent& content);
     CFieldEdit* MakeRotation(int axis);
     QComboBox* MakeAxis(int axis);

@@ -62,7 +62,6 @@ CEditorControls::CEditorControls(const CGaitConvertContent& content, QWidget* wi
 {
     auto* const layout = new QVBoxLayout(window);
     layout->addLayout(MakeFields());
-    layout->addWidget(MakeFilterLine());
     layout->addLayout(MakeTrees(), kTreeStretch);
     layout->addLayout(MakePairLine());
     layout->addLayout(MakeRows(content), kRowStretch);
@@ -85,39 +84,35 @@ QLayout* CEditorControls::MakeFields()
     return line;
 }
 
-QWidget* CEditorControls::MakeFilterLine()
-{
-    m_pkFilterLine = new QWidget(m_pkWindow);
-    m_pkFilterLine->setObjectName(QStringLiteral("filterLine"));
-    m_pkFilter = new CFieldEdit(m_pkFilterLine);
-    m_pkFilter->setObjectName(QStringLiteral("filter"));
-    m_pkFilter->setAccessibleName(QObject::tr("Find Bone:"));
-    m_pkFilter->setClearButtonEnabled(true);
-    auto* const line = new QHBoxLayout(m_pkFilterLine);
-    line->setContentsMargins({});
-    line->addWidget(MakeLabel(QObject::tr("Find Bone:"), m_pkFilter));
-    line->addWidget(m_pkFilter);
-    m_pkFilterLine->hide();
-    return m_pkFilterLine;
-}
-
 QLayout* CEditorControls::MakeTrees()
 {
-    m_pkSourceTree = MakeTree(kSourceTree, QObject::tr("Source Bones:"));
-    m_pkTargetTree = MakeTree(kTargetTree, QObject::tr("Kestro TK Bones:"));
     auto* const line = new QHBoxLayout;
-    line->addLayout(Titled(m_pkSourceTree, nullptr));
-    line->addLayout(
-        Titled(m_pkTargetTree, MakeHint(QObject::tr("Find: Ctrl+F"), QStringLiteral("findHint"))));
+    line->addLayout(MakeTree(kSourceTree, QObject::tr("Source Bones:"), m_pkSourceTree));
+    line->addLayout(MakeTree(kTargetTree, QObject::tr("Kestro TK Bones:"), m_pkTargetTree));
     return line;
 }
 
-CBoneTreeView* CEditorControls::MakeTree(int id, const QString& title)
+QLayout* CEditorControls::MakeTree(int id, const QString& title, CBoneTreeView*& tree)
 {
-    auto* const tree = new CBoneTreeView(m_pkWindow);
+    CFieldEdit* const search = MakeSearch(id, QObject::tr("Find in %1").arg(title));
+    tree = new CBoneTreeView(m_pkWindow);
     tree->setObjectName(Name(id));
     tree->setAccessibleName(title);
-    return tree;
+    m_kSearches.push_back({search, tree});
+    return Titled(tree, search, 1);
+}
+
+CFieldEdit* CEditorControls::MakeSearch(int tree, const QString& name)
+{
+    auto* const search = new CFieldEdit(m_pkWindow);
+    search->setObjectName(QStringLiteral("search") + Name(tree));
+    search->setAccessibleName(name);
+    search->setPlaceholderText(QObject::tr("Find (Ctrl+F)"));
+    search->setToolTip(
+        QObject::tr("Part of a bone's name. Enter selects the first match, Down the next ones; "
+                    "Escape clears the search."));
+    search->setClearButtonEnabled(true);
+    return search;
 }
 
 QLayout* CEditorControls::MakePairLine()
@@ -136,8 +131,8 @@ QLayout* CEditorControls::MakeRows(const CGaitConvertContent& content)
     m_pkRows = new CMapRowView(content, m_pkWindow);
     m_pkRows->setObjectName(Name(kMapRowList));
     m_pkRows->setAccessibleName(QObject::tr("Bone Map List:"));
-    return Titled(m_pkRows,
-                  MakeHint(QObject::tr("Undo: Ctrl+Z    Redo: Ctrl+Y"), QStringLiteral("undoHint")));
+    const QString keys = QObject::tr("Remove: Delete    Undo: Ctrl+Z    Redo: Ctrl+Y");
+    return Titled(m_pkRows, MakeHint(keys, QStringLiteral("undoHint")), 0);
 }
 
 QLayout* CEditorControls::MakeRowButtons()
@@ -184,12 +179,13 @@ QPushButton* CEditorControls::MakeButton(int id)
     return button;
 }
 
-QLayout* CEditorControls::Titled(QWidget* widget, QLabel* hint)
+QLayout* CEditorControls::Titled(QWidget* widget, QWidget* beside, int stretch)
 {
     auto* const heading = new QHBoxLayout;
     heading->addWidget(MakeLabel(widget->accessibleName(), widget));
-    if (hint)
-        heading->addWidget(hint, 0, Qt::AlignRight);
+    if (stretch == 0)
+        heading->addStretch();
+    heading->addWidget(beside, stretch);
     auto* const column = new QVBoxLayout;
     column->addLayout(heading);
     column->addWidget(widget);

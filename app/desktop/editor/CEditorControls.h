@@ -34,13 +34,19 @@ public:
         QPushButton* button;
     };
 
+    /// A tree and the field that filters it.
+    struct Search
+    {
+        CFieldEdit* edit;
+        CBoneTreeView* tree;
+    };
+
     /// Fills a window that has no layout yet and owns the controls. `content` provides the column names.
     CEditorControls(const CGaitConvertContent& content, QWidget* window);
 
     std::vector<Field> m_kFields;
     std::vector<Button> m_kButtons;
-    QWidget* m_pkFilterLine = nullptr; ///< hidden until the user filters bones
-    CFieldEdit* m_pkFilter = nullptr;
+    std::vector<Search> m_kSearches; ///< source, then target
     CBoneTreeView* m_pkSourceTree = nullptr;
     CBoneTreeView* m_pkTargetTree = nullptr;
     CElidedLabel* m_pkPair = nullptr; ///< the pair that Add to Map would add
@@ -48,17 +54,17 @@ public:
 
 private:
     QLayout* MakeFields();
-    QWidget* MakeFilterLine();
     QLayout* MakeTrees();
-    CBoneTreeView* MakeTree(int id, const QString& title);
+    QLayout* MakeTree(int id, const QString& title, CBoneTreeView*& tree);
+    CFieldEdit* MakeSearch(int tree, const QString& name);
     QLayout* MakePairLine();
     QLayout* MakeRows(const CGaitConvertContent& content);
     QLayout* MakeRowButtons();
     void MakeUnusedControls();
     CFieldEdit* MakeField(int id, const QString& name);
     QPushButton* MakeButton(int id);
-    /// A list under its title, with an optional hint to the right.
-    QLayout* Titled(QWidget* widget, QLabel* hint);
+    /// A list under its title, with another widget to the right of the title.
+    QLayout* Titled(QWidget* widget, QWidget* beside, int stretch);
     QLabel* MakeLabel(const QString& text, QWidget* buddy);
     QLabel* MakeHint(const QString& text, const QString& name);
 

@@ -1,6 +1,7 @@
 #include "CFieldEdit.h"
 
 #include <QKeyEvent>
+#include <QStyle>
 
 namespace gw {
 
@@ -8,6 +9,15 @@ void CFieldEdit::ShowText(const QString& text)
 {
     if (this->text() != text)
         setText(text);
+}
+
+void CFieldEdit::ShowFailure(bool failed)
+{
+    constexpr const char* kProperty = "failed"; // the style sheet has a rule for it
+    if (property(kProperty).toBool() == failed)
+        return;
+    setProperty(kProperty, failed);
+    style()->polish(this);
 }
 
 bool CFieldEdit::event(QEvent* event)
@@ -21,14 +31,6 @@ bool CFieldEdit::event(QEvent* event)
             return false;
     }
     return QLineEdit::event(event);
-}
-
-void CFieldEdit::keyPressEvent(QKeyEvent* event)
-{
-    if (event->key() == Qt::Key_Escape && onEscape_)
-        onEscape_();
-    else
-        QLineEdit::keyPressEvent(event);
 }
 
 void CFieldEdit::focusOutEvent(QFocusEvent* event)

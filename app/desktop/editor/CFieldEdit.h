@@ -14,19 +14,17 @@ public:
 
     /// Called when the focus moves elsewhere, even to another window, but not to a menu over the field.
     void SetOnLeave(std::function<void()> onLeave) { onLeave_ = std::move(onLeave); }
-    /// Called for the Escape key, which is then not passed on. If not set, the window handles the key.
-    void SetOnEscape(std::function<void()> onEscape) { onEscape_ = std::move(onEscape); }
     /// Shows a text. Does not touch typing or the caret if it is already shown.
     void ShowText(const QString& text);
+    /// Shows by its color whether the text is a search that found nothing.
+    void ShowFailure(bool failed);
 
 protected:
     bool event(QEvent* event) override;
-    void keyPressEvent(QKeyEvent* event) override;
     void focusOutEvent(QFocusEvent* event) override;
 
 private:
     std::function<void()> onLeave_;
-    std::function<void()> onEscape_;
 };
 
 } // namespace gw

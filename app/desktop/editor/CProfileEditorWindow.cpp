@@ -10,14 +10,19 @@
 #include "CGaitConvertContent.h"
 #include "CMapRowView.h"
 #include "CProfileEditorDialog.h"
+#include "PairText.h"
+#include "PlaceBeside.h"
 #include "QtText.h"
 #include "WindowPlace.h"
 
+#include <QAbstractButton>
 #include <QGuiApplication>
 #include <QKeyEvent>
 #include <QPushButton>
+#include <QScopedValueRollback>
 #include <QShortcut>
 #include <QTimer>
+#include <algorithm>
 #include <utility>
 
 namespace gw {
@@ -27,6 +32,14 @@ namespace {
 constexpr const char* kPlaceSetting = "DialogPos";
 // A stored position is used only if its size is this; a larger font makes the window larger.
 constexpr QSize kTemplateSize(720, 640);
+// The editor's messages, from the limits of a number to the question before a file is replaced.
+constexpr int kFirstMessage = 157;
+constexpr int kLastMessage = 163;
+
+bool IsEnter(const QKeyEvent& event)
+{
+    return event.key() == Qt::Key_Return || event.key() == Qt::Key_Enter;
+}
 
 } // namespace
 
@@ -64,8 +77,8 @@ void CProfileEditorWindow::ConnectTrees()
 {
     m_kControls.m_pkSourceTree->SetOnSelect([this](int item) { Model().SelectSourceItem(item); });
     m_kControls.m_pkTargetTree->SetOnSelect([this](int item) { Model().SelectTargetItem(item); });
-    connect(m_kControls.m_pkFilter, &QLineEdit::textChanged, this, [this] { Refresh(); });
-    m_kControls.m_pkFilter->SetOnEscape([this] { CloseFilter(); });
+    for (const CEditorControls::Search& search : m_kControls.m_kSearches)
+        connect(search.edit, &QLineEdit::textChanged, this, [this] { Refresh(); });
 }
 
 void CProfileEditorWindow::ConnectRows()
@@ -89,10 +102,16 @@ void CProfileEditorWindow::AddShortcuts()
     const auto add = [this](const QKeySequence& keys, auto action) {
         connect(new QShortcut(keys, this), &QShortcut::activated, this, action);
     };
-    add(Qt::CTRL | Qt::Key_F, [this] { OpenFilter(); });
+    add(Qt::CTRL | Qt::Key_F, [this] { OpenSearch(); });
     add(Qt::CTRL | Qt::Key_Z, [this] { Model().Undo(); });
     add(Qt::CTRL | Qt::SHIFT | Qt::Key_Z, [this] { Model().Redo(); });
     add(Qt::CTRL | Qt::Key_Y, [this] { Model().Redo(); });
+    add(Qt::CTRL | Qt::Key_Return, [this] { ClickInOwner("convert"); });
+    add(Qt::CTRL | Qt::Key_Enter, [this] { ClickInOwner("convert"); });
+    add(Qt::CTRL | Qt::Key_S, [this] { ClickInOwner("apply"); });
+    auto* const remove =
+        new QShortcut(QKeySequence::Delete, m_kControls.m_pkRows, nullptr, nullptr, Qt::WidgetShortcut);
+    connect(remove, &QShortcut::activated, this, [this] { Model().ClickButton(kRemoveButton); });
 }
 
 CProfileEditorDialog& CProfileEditorWindow::Model() const
@@ -122,18 +141,74 @@ void CProfileEditorWindow::ReleaseButtons()
     }
 }
 
-void CProfileEditorWindow::OpenFilter()
+// Returns the search whose field or tree has the keyboard, or null.
+const CEditorControls::Search* CProfileEditorWindow::FocusedSearch() const
 {
-    m_kControls.m_pkFilterLine->show();
-    m_kControls.m_pkFilter->setFocus();
-    m_kControls.m_pkFilter->selectAll();
+    const auto hasFocus = [](const auto& search) {
+        return search.edit->hasFocus() || search.tree->hasFocus();
+    };
+    const auto found = std::ranges::find_if(m_kControls.m_kSearches, hasFocus);
+    return found == m_kControls.m_kSearches.end() ? nullptr : &*found;
 }
 
-void CProfileEditorWindow::CloseFilter()
+// A second Ctrl+F searches the other tree.
+void CProfileEditorWindow::OpenSearch()
 {
-    m_kControls.m_pkFilter->clear();
-    m_kControls.m_pkSourceTree->setFocus();
-    m_kControls.m_pkFilterLine->hide();
+    const CEditorControls::Search& source = m_kControls.m_kSearches.front();
+    const CEditorControls::Search& target = m_kControls.m_kSearches.back();
+    CFieldEdit* const edit = target.tree->hasFocus() || source.edit->hasFocus() ? target.edit : source.edit;
+    edit->setFocus();
+    edit->selectAll();
+}
+
+// Selects a match and shows the whole tree around it. Returns false if the keyboard is not in a search.
+bool CProfileEditorWindow::AcceptSearch()
+{
+    const CEditorControls::Search* const search = FocusedSearch();
+    if (!search || search->edit->text().isEmpty())
+        return false;
+    Redraw(); // keys can arrive faster than the list is updated
+    if (search->tree->hasFocus() || search->tree->SelectFirst())
+    {
+        search->tree->setFocus();
+        search->edit->clear();
+    }
+    return true;
+}
+
+// Returns false if there is no search to clear.
+bool CProfileEditorWindow::ClearSearch()
+{
+    bool cleared = false;
+    for (const CEditorControls::Search& search : m_kControls.m_kSearches)
+    {
+        cleared = cleared || !search.edit->text().isEmpty();
+        search.edit->clear();
+    }
+    return cleared;
+}
+
+void CProfileEditorWindow::EnterResults()
+{
+    const CEditorControls::Search* const search = FocusedSearch();
+    Redraw();
+    if (search && search->edit->hasFocus() && search->tree->SelectFirst())
+        search->tree->setFocus();
+}
+
+// The typing in a field counts for a conversion, as if the button had been clicked with the mouse.
+void CProfileEditorWindow::ClickInOwner(const char* child)
+{
+    LeaveField();
+    const QScopedValueRollback clicking(m_bClickingInOwner, true);
+    if (auto* const button = parentWidget()->findChild<QAbstractButton*>(QLatin1String(child)))
+        button->click();
+}
+
+bool CProfileEditorWindow::Raised(int messageId) const
+{
+    const bool isOwn = messageId >= kFirstMessage && messageId <= kLastMessage;
+    return isVisible() && (isOwn || m_bClickingInOwner);
 }
 
 void CProfileEditorWindow::SetShown(bool shown)
@@ -164,6 +239,8 @@ void CProfileEditorWindow::RestorePlace()
     resize(kTemplateSize.expandedTo(minimumSizeHint()));
     if (const auto place = ReadWindowPlace(platform_, kPlaceSetting, size()))
         move(*place);
+    else
+        PlaceBeside(*this, *parentWidget()->window());
 }
 
 void CProfileEditorWindow::Hide()
@@ -183,12 +260,17 @@ void CProfileEditorWindow::reject()
     Model().Close();
 }
 
-// Enter commits a field without closing the window.
+// Enter accepts a search or commits a field; it never closes the window. Escape clears a search first.
 void CProfileEditorWindow::keyPressEvent(QKeyEvent* event)
 {
-    if (event->key() == Qt::Key_Return || event->key() == Qt::Key_Enter)
-        setFocus();
-    else
+    if (IsEnter(*event))
+    {
+        if (!AcceptSearch())
+            setFocus();
+    }
+    else if (event->key() == Qt::Key_Down)
+        EnterResults();
+    else if (event->key() != Qt::Key_Escape || !ClearSearch())
         QDialog::keyPressEvent(event);
 }
 
@@ -220,9 +302,11 @@ void CProfileEditorWindow::Redraw()
 
 void CProfileEditorWindow::ShowTrees()
 {
-    const std::string filter = ToUtf8(m_kControls.m_pkFilter->text());
-    m_kControls.m_pkSourceTree->ShowTree(Model().SourceTree(), filter);
-    m_kControls.m_pkTargetTree->ShowTree(Model().TargetTree(), filter);
+    const auto& searches = m_kControls.m_kSearches;
+    m_kControls.m_pkSourceTree->ShowTree(Model().SourceTree(), ToUtf8(searches.front().edit->text()));
+    m_kControls.m_pkTargetTree->ShowTree(Model().TargetTree(), ToUtf8(searches.back().edit->text()));
+    for (const CEditorControls::Search& search : searches)
+        search.edit->ShowFailure(!search.edit->text().isEmpty() && search.tree->topLevelItemCount() == 0);
 }
 
 void CProfileEditorWindow::ShowFieldsAndButtons()
@@ -236,12 +320,10 @@ void CProfileEditorWindow::ShowFieldsAndButtons()
 // Keeps the pair readable while the filter hides one of its bones.
 void CProfileEditorWindow::ShowPair()
 {
-    const QString source = ToQString(Model().SourceTree().SelectedText());
-    const QString target = ToQString(Model().TargetTree().SelectedText());
-    const bool both = !source.isEmpty() && !target.isEmpty();
-    const QString text =
-        both ? source + QStringLiteral(" \u2192 ") + target : tr("Select a bone on each side.");
-    m_kControls.m_pkPair->ShowText(text);
+    const std::string& source = Model().SourceTree().SelectedText();
+    const std::string& target = Model().TargetTree().SelectedText();
+    const bool both = !source.empty() && !target.empty();
+    m_kControls.m_pkPair->ShowText(both ? PairText(source, target) : tr("Select a bone on each side."));
 }
 
 } // namespace gw

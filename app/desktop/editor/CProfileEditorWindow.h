@@ -29,8 +29,11 @@ public:
     /// Runs the dialog that edits one row, modal to this window if it is visible, otherwise to the owner.
     /// Returns true on OK.
     bool RunBoneOffset(CBoneOffsetDialog& dialog);
+    /// Returns whether this window raised a message, or a file dialog (id 0).
+    bool Raised(int messageId) const;
 
-    /// Handles Escape and the window's close button: commits the field being edited and closes.
+    /// Handles Escape without a search, and the window's close button: commits the field being edited and
+    /// closes.
     void reject() override;
 
 protected:
@@ -45,8 +48,12 @@ private:
     CProfileEditorDialog& Model() const;
     void LeaveField();
     void ReleaseButtons();
-    void OpenFilter();
-    void CloseFilter();
+    const CEditorControls::Search* FocusedSearch() const;
+    void OpenSearch();
+    bool AcceptSearch();
+    bool ClearSearch();
+    void EnterResults();
+    void ClickInOwner(const char* child);
     void RestorePlace();
     void Hide();
     void Redraw();
@@ -62,6 +69,7 @@ private:
     bool m_bPlaced = false;
     bool m_bRedrawQueued = false;
     bool m_bLeavingField = false;
+    bool m_bClickingInOwner = false; ///< a command of the main window was started here
 };
 
 } // namespace gw

@@ -43,6 +43,7 @@ CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : Q
         m_kChildren[child.name] = widget;
         Connect(widget);
     }
+    ConnectMarks();
     ShowNoteCount();
     connect(qApp, &QApplication::focusChanged, this, [this] { update(); });
 }
@@ -249,7 +250,13 @@ void CContent::SetChildTip(std::string_view child, const std::string& text)
 std::unique_ptr<CMotionView> CContent::CreateView(std::string_view child)
 {
     auto* const surface = Child<CPreviewWidget>(child);
-    return surface ? surface->MakeView() : nullptr;
+    if (!surface)
+        return nullptr;
+    surface->follow = [this](bool on) { m_pkLogic->SetFollow(on); };
+    surface->clickBone = [this, name = std::string(child)](const std::string& bone) {
+        m_pkLogic->ClickBone(name, bone);
+    };
+    return surface->MakeView();
 }
 
 CCntComboExControl& CContent::CreateComboEx(std::string_view field, std::string_view arrow, int fontSize)

@@ -72,6 +72,8 @@ public:
     CCntComboExControl& CreateComboEx(std::string_view field, std::string_view arrow, int fontSize) override;
     void SetTimer(int id, int milliseconds) override;
     void KillTimer(int id) override;
+    void WatchMarks() override;
+    void ShowMarks(const MotionMarks& marks) override;
     void ShowProfileEditor(bool visible) override;
     void RefreshProfileEditor() override;
     bool RunBoneOffset(CBoneOffsetDialog& dialog) override;
@@ -88,14 +90,17 @@ private:
     Widget* Child(std::string_view name) const;
     void Connect(QWidget* child);
     void ConnectBar(QWidget* child);
+    void ConnectMarks();
     void Click(const std::string& child);
+    QWidget* Asker(int messageId = 0);
     void ShowNoteCount();
     void ShowNotes();
     void MakeHint(QWidget* view);
     void FocusView();
     void FocusNext();
     void RunSoon(ERemedy remedy);
-    EAnswer AskWithOffers(const std::string& text, EButtons buttons, const BoxExtras& extras);
+    EAnswer AskWithOffers(QWidget* asker, const std::string& text, EButtons buttons,
+                          const BoxExtras& extras);
     std::string Notes() const;
 
     const CLeftKeys& keys_;
@@ -105,6 +110,7 @@ private:
     std::map<int, std::unique_ptr<QTimer>> m_kTimers;
     CProfileCombo m_kCombo;
     std::vector<Notice> m_kNotices; ///< of the current step, or of the last one until the next begins
+    QTimer m_kMarksClock;           ///< runs while marks are measured
     QElapsedTimer m_kSincePainted;  ///< during an operation
     std::map<std::string, CHintPanel*, std::less<>> m_kHints; ///< by view
     int m_iWaits = 0;

@@ -3,6 +3,7 @@
 #include "CContent.h"
 #include "CGaitConvertContent.h"
 #include "CMessageBox.h"
+#include "CProfileEditorWindow.h"
 #include "CSelectFolderDialog.h"
 #include "DesktopServices.h"
 #include "FileDialog.h"
@@ -33,22 +34,23 @@ EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons butto
     const CArrowCursor arrow;
     // Notices are cleared when a step begins, so outside a step they are from an earlier one.
     if (m_iWaits == 0 || !EndsStep(id))
-        return AskWithOffers(text, buttons, {});
+        return AskWithOffers(Asker(id), text, buttons, {});
     BoxExtras extras;
     extras.details = Notes();
     if (id == kInvalidSourceMessage || id == kCannotConvertMessage)
         extras.summary = m_pkLogic->SummaryOf(m_kNotices);
     for (const Offer& offer : m_pkLogic->OffersFor(m_kNotices))
         extras.offers.push_back(offer.button);
-    return AskWithOffers(text, buttons, extras);
+    return AskWithOffers(Asker(id), text, buttons, extras);
 }
 
-EAnswer CContent::AskWithOffers(const std::string& text, EButtons buttons, const BoxExtras& extras)
+EAnswer CContent::AskWithOffers(QWidget* asker, const std::string& text, EButtons buttons,
+                                const BoxExtras& extras)
 {
     const std::vector<Offer> offers = m_pkLogic->OffersFor(m_kNotices);
     int chosen = -1;
     const EAnswer answer =
-        RunMessageBox(this, m_pkLogic->Message(kTitleMessage), text, buttons, extras, &chosen);
+        RunMessageBox(asker, m_pkLogic->Message(kTitleMessage), text, buttons, extras, &chosen);
     if (chosen >= 0)
         RunSoon(offers[static_cast<size_t>(chosen)].remedy);
     return answer;
@@ -65,6 +67,11 @@ void CContent::RunSoon(ERemedy remedy)
     });
 }
 
+QWidget* CContent::Asker(int messageId)
+{
+    return m_pkEditor && m_pkEditor->Raised(messageId) ? static_cast<QWidget*>(m_pkEditor) : this;
+}
+
 void CContent::ShowNotes()
 {
     BoxExtras extras;
@@ -72,8 +79,8 @@ void CContent::ShowNotes()
     extras.shown = EDetails::Unfolded;
     for (const Offer& offer : m_pkLogic->OffersFor(m_kNotices))
         extras.offers.push_back(offer.button);
-    AskWithOffers(ToUtf8(QCoreApplication::translate("Face", "Warnings from the last step")), EButtons::OK,
-                  extras);
+    AskWithOffers(this, ToUtf8(QCoreApplication::translate("Face", "Warnings from the last step")),
+                  EButtons::OK, extras);
 }
 
 std::optional<std::string> CContent::AskOpenFile(const FileDialogSetup& setup)
@@ -85,7 +92,7 @@ std::optional<std::string> CContent::AskOpenFile(const FileDialogSetup& setup)
 std::optional<std::string> CContent::AskSaveFile(const FileDialogSetup& setup)
 {
     const CArrowCursor arrow;
-    return RunFileDialog(*this, QFileDialog::AcceptSave, setup);
+    return RunFileDialog(*Asker(), QFileDialog::AcceptSave, setup);
 }
 
 std::optional<FolderChoice> CContent::AskFolder(const FileDialogSetup& setup)

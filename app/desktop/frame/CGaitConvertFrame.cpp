@@ -123,6 +123,8 @@ void CGaitConvertFrame::AddShortcuts()
     }
     // Not a click: with the left Ctrl key, that would start a batch run.
     add(Qt::CTRL | Qt::Key_O, [this] { m_spContent->OpenSource(); });
+    add(QKeyCombination(Qt::Key_T), [this] { m_spContent->SetFollow(!m_spContent->IsFollowing()); });
+    add(QKeyCombination(Qt::Key_N), [this] { m_spContent->GoToNextWorst(); });
     add(Qt::CTRL | Qt::Key_M, [this] { m_spContent->TakeOffer(); });
     add(QKeyCombination(Qt::Key_F), [this] { m_pkFace->FrameAll(); });
 }

@@ -25,8 +25,8 @@ constexpr size_t kFileByteLimit = 1 << 20;
 constexpr int kLongestSide = 4096;
 
 constexpr std::string_view kKinds[] = {
-    "picture", "text", "caption", "value", "button", "primary",
-    "toggle",  "view", "bar",     "combo", "arrow",  "line",
+    "picture", "text", "caption", "value", "button", "primary", "toggle",
+    "view",    "bar",  "marks",   "combo", "arrow",  "line",
 };
 
 // The children that the program looks up by name.

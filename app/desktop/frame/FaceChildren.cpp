@@ -4,6 +4,7 @@
 
 #include "CElidedLabel.h"
 #include "CMapField.h"
+#include "CMarkStrip.h"
 #include "CPlaybar.h"
 #include "CPreviewWidget.h"
 #include "CTitleLabel.h"
@@ -94,6 +95,8 @@ QWidget* MakeWidget(const SkinChild& child, const CSkin& skin, const CLeftKeys& 
         return MakeTitle(face);
     if (child.kind == "view")
         return MakeFocusableView(keys, face);
+    if (child.kind == "marks")
+        return new CMarkStrip(face);
     if (child.kind == "bar")
         return new CPlaybar(face);
     if (child.kind == "combo")

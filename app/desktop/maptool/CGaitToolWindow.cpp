@@ -69,6 +69,15 @@ void CGaitToolWindow::Click(int id)
     Forward([&] { m_kTool.ClickButton(id); });
 }
 
+// The result has the target's bones.
+void CGaitToolWindow::ClickBone(EToolMotion motion, const std::string& bone)
+{
+    if (motion == EToolMotion::Source)
+        Forward([&] { m_kTool.SelectSourceItem(m_kTool.SourceTree().Find(bone)); });
+    else
+        Forward([&] { m_kTool.SelectTargetItem(m_kTool.TargetTree().Find(bone)); });
+}
+
 void CGaitToolWindow::Tick()
 {
     if (!m_kTool.Advance())

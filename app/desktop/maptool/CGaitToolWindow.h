@@ -61,6 +61,7 @@ private:
     void Forward(const std::function<void()>& operation);
     void SelectLine(const QModelIndex& line);
     void Click(int id);
+    void ClickBone(EToolMotion motion, const std::string& bone);
     void Tick();
     void Refresh();
     void ShowFrames();

@@ -115,6 +115,8 @@ void CMapLineDialog::AddNumber(QFormLayout& form, const QString& label, int valu
     field->setRange(std::numeric_limits<int>::min(), std::numeric_limits<int>::max());
     field->setValue(value);
     field->setFixedWidth(kFieldWidth);
+    if (form.rowCount() == 1) // the first field gets the keyboard
+        field->selectAll();
     form.addRow(label, field);
     m_kStore.emplace_back([field, store = std::move(store)](MapLine& line) { store(line, field->value()); });
 }
@@ -125,6 +127,7 @@ void CMapLineDialog::AddText(QFormLayout& form)
     field->setObjectName(QStringLiteral("text"));
     field->setAccessibleName(windowTitle());
     field->setFixedWidth(kFieldWidth);
+    field->selectAll();
     form.addRow(windowTitle(), field);
     m_kStore.emplace_back([field](MapLine& line) { line.text = ToUtf8(field->text()); });
 }

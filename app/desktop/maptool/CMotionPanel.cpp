@@ -143,6 +143,12 @@ void CMotionPanel::ShowFrame(int frame, int lastFrame)
     m_pkFrame->setText(QCoreApplication::translate(kContext, "frame %1 of %2").arg(frame).arg(lastFrame));
 }
 
+void CMotionPanel::SetBoneClicked(std::function<void(const std::string& bone)> clicked)
+{
+    if (m_pkPreview)
+        m_pkPreview->clickBone = std::move(clicked);
+}
+
 void CMotionPanel::SetDropped(std::function<void(const QString&)> dropped)
 {
     dropped_ = std::move(dropped);

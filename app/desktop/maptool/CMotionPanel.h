@@ -27,6 +27,8 @@ public:
     void ShowFrame(int frame, int lastFrame);
     /// Sets the function to call with the id of a clicked transport button.
     void SetClicked(std::function<void(int id)> clicked) { clicked_ = std::move(clicked); }
+    /// Called with the bone that was clicked in the picture.
+    void SetBoneClicked(std::function<void(const std::string& bone)> clicked);
     /// Called with a dropped motion file. If not set, nothing can be dropped.
     void SetDropped(std::function<void(const QString& path)> dropped);
 

@@ -14,6 +14,7 @@
 #include <QLabel>
 #include <QListView>
 #include <QMenu>
+#include <QScreen>
 #include <QShortcut>
 #include <algorithm>
 
@@ -21,7 +22,8 @@ namespace gw {
 
 namespace {
 
-constexpr QSize kWindowSize(1080, 800);
+constexpr QSize kWindowSize(1080, 800); // if the screen is large enough
+constexpr QSize kFrameSize(12, 40);     // guess of what the window manager adds
 constexpr int kMargin = 12;
 constexpr int kGap = 8;
 constexpr int kColumns = 3;
@@ -78,7 +80,7 @@ void CGaitToolWindow::MakeLayout(const CLeftKeys& keys)
     MakeTrees(*grid);
     MakeLines(*grid);
     MakeStatus(*grid);
-    resize(kWindowSize);
+    resize(kWindowSize.boundedTo(screen()->availableSize() - kFrameSize));
     findChild<QPushButton*>(QString::number(kToolLoadSource))->setFocus();
 }
 
@@ -115,6 +117,7 @@ void CGaitToolWindow::MakePanels(QGridLayout& grid, const CLeftKeys& keys)
         const int column = static_cast<int>(motion);
         auto* const panel = new CMotionPanel(motion, keys, this);
         panel->SetClicked([this](int id) { Click(id); });
+        panel->SetBoneClicked([this, motion](const std::string& bone) { ClickBone(motion, bone); });
         if (motion != EToolMotion::Result)
         {
             panel->SetDropped([this, motion](const QString& path) {

@@ -143,6 +143,13 @@ void CBoneTreeView::ShowSelection(const CBoneTree& tree)
         setCurrentItem(item); // scrolls to it
 }
 
+bool CBoneTreeView::SelectFirst()
+{
+    QTreeWidgetItem* const first = topLevelItem(0);
+    setCurrentItem(first);
+    return first != nullptr;
+}
+
 void CBoneTreeView::NoteFolding(const QTreeWidgetItem* item, bool folded)
 {
     if (!m_bShowing)

@@ -20,6 +20,8 @@ public:
     void SetOnSelect(std::function<void(int item)> onSelect) { onSelect_ = std::move(onSelect); }
     /// Shows a tree: completely if the filter is empty, otherwise a flat list of the matching bones.
     void ShowTree(const CBoneTree& tree, const std::string& filter);
+    /// Selects the bone at the top, as if the user had. Returns false if no bone is visible.
+    bool SelectFirst();
 
 protected:
     void selectionChanged(const QItemSelection& selected, const QItemSelection& deselected) override;
