@@ -7,26 +7,36 @@
 #include "ConversionMeasures.h"
 #include "KeyFigures.h"
 #include "PageStyle.h"
+#include "PageTable.h"
 #include "Paths.h"
 
 #include <algorithm>
-#include <limits>
 
 namespace gw {
 
-void CConversionPage::Add(const std::string& source, const CPagePart& part)
+void CConversionPage::AddDetails(const CPagePart& part)
 {
-    ++m_uiSections;
+    if (!part.HasFigures() || IsDetailed(part.Number()))
+        return;
+    m_kDetailed.push_back(part.Number());
     m_kSections.Write(part.Section());
-    m_kRows.push_back({source, part.Row(), part.Badness()});
 }
 
-void CConversionPage::AddWithoutFigures(const std::string& source, const std::string& outcome)
+bool CConversionPage::IsDetailed(size_t number) const
 {
-    CMarkup row;
-    row.Raw("<tr><td class=\"word\">").FileName(source).Raw("</td><td class=\"word none\" colspan=\"");
-    row.Integer(static_cast<long long>(KeyFigureCount()) + 1).Raw("\">").Name(outcome).Raw("</td></tr>\n");
-    m_kRows.push_back({source, row.Text(), std::numeric_limits<double>::infinity()});
+    return std::ranges::find(m_kDetailed, number) != m_kDetailed.end();
+}
+
+std::vector<size_t> CConversionPage::WorstWithoutDetails() const
+{
+    std::vector<size_t> worst;
+    const std::vector<RankedRow> ranked = RankRows(m_kRows);
+    for (const RankedRow& row : std::span(ranked).first(std::min(ranked.size(), kDetailCount)))
+    {
+        if (!row.figures.empty() && !IsDetailed(row.number))
+            worst.push_back(row.number - 1);
+    }
+    return worst;
 }
 
 std::string CConversionPage::Head() const
@@ -44,28 +54,23 @@ std::string CConversionPage::Head() const
         "<h1>Conversion report</h1>\n<p class=\"about\">The result compared with the source, at every frame "
         "of the source, starting at 0. Lengths are millimeters of the result; the source is scaled to "
         "the result's leg length.</p>\n");
-    if (m_kRows.size() > 1 || m_uiSections == 0)
-        AppendSummary(page);
+    if (m_kRows.size() > 1)
+        AppendOverview(page);
     return page.Text();
 }
 
-void CConversionPage::AppendSummary(CMarkup& page) const
+void CConversionPage::AppendOverview(CMarkup& page) const
 {
-    std::vector<const Row*> rows;
-    for (const Row& row : m_kRows)
-        rows.push_back(&row);
-    std::ranges::stable_sort(rows, std::ranges::greater(), &Row::badness);
-    page.Raw("<div class=\"wide\"><table class=\"summary\"><thead><tr><th class=\"word\">source, worst "
-             "first</th><th>frames</th>");
-    for (const KeyFigure& figure : KeyFiguresOf({}, {}))
-        page.Raw("<th>").Raw(figure.label).Raw("</th>");
-    page.Raw("</tr></thead><tbody>\n");
-    for (const Row* row : rows)
-        page.Raw(row->markup);
-    page.Raw("</tbody></table></div>\n<p class=\"about\">");
-    for (const EVerdict verdict : {EVerdict::Good, EVerdict::Fair, EVerdict::Poor, EVerdict::None})
-        page.Raw(VerdictSign(verdict)).Raw(" ").Raw(VerdictWord(verdict)).Raw("   ");
-    page.Raw("</p>\n");
+    std::vector<RankedRow> ranked = RankRows(m_kRows);
+    for (RankedRow& row : ranked)
+        row.hasSection = IsDetailed(row.number);
+    AppendFailures(page, m_kRows);
+    AppendTotals(page, m_kRows, ranked);
+    AppendRunTable(page, ranked);
+    if (!m_kDetailed.empty() && m_kDetailed.size() < ranked.size())
+        page.Raw("<h3>The worst ")
+            .Integer(static_cast<long long>(m_kDetailed.size()))
+            .Raw(" in detail</h3>\n");
 }
 
 std::string CConversionPage::Foot()

@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CSpool.h"
+#include "PageRow.h"
 
 #include <cstddef>
 #include <string>
@@ -11,36 +12,36 @@ namespace gw {
 class CMarkup;
 class CPagePart;
 
-/// A self-contained page about conversions: it needs no scripts, no other files and no network. A page about
-/// several conversions begins with a table of them, worst first.
+/// A self-contained page about conversions: it needs no other files and no network. A page about several
+/// sources begins with the failures, the totals and a sortable table; it shows details of a few only.
 class CConversionPage
 {
 public:
-    /// Adds a conversion whose part has been drawn.
-    void Add(const std::string& source, const CPagePart& part);
-    /// Adds a source without figures to show; `outcome` is its text in the table.
-    void AddWithoutFigures(const std::string& source, const std::string& outcome);
+    /// How many conversions of a run are shown in detail. With ten thousand, the page would be too large.
+    static constexpr size_t kDetailCount = 20;
 
-    /// Returns whether any conversion with figures was added.
-    bool HasConversions() const { return m_uiSections > 0; }
+    /// Adds a source.
+    void Add(PageRow row) { m_kRows.push_back(std::move(row)); }
+    /// Adds the details of the source with the part's number. Nothing happens without any, or if the source
+    /// has details already.
+    void AddDetails(const CPagePart& part);
+
+    /// Returns the indices of the worst kDetailCount conversions that have no details yet.
+    std::vector<size_t> WorstWithoutDetails() const;
+    /// Returns whether there is anything to show: details, or several sources.
+    bool HasContent() const { return m_kRows.size() > 1 || !m_kDetailed.empty(); }
 
     /// Replaces the page atomically. Returns false, leaving an existing file unchanged, if that fails.
     bool Write(const std::string& path);
 
 private:
-    struct Row
-    {
-        std::string source;
-        std::string markup;
-        double badness = 0.0;
-    };
-
+    bool IsDetailed(size_t number) const;
     std::string Head() const;
     static std::string Foot();
-    void AppendSummary(CMarkup& page) const;
+    void AppendOverview(CMarkup& page) const;
 
-    std::vector<Row> m_kRows;
-    size_t m_uiSections = 0;
+    std::vector<PageRow> m_kRows;
+    std::vector<size_t> m_kDetailed; ///< numbers of the sources that have details
     CSpool m_kSections;
 };
 

@@ -3,6 +3,8 @@
 #include "FigureDrawing.h"
 #include "HostBones.h"
 #include "PathDrawing.h"
+#include "Player.h"
+#include "SourceScale.h"
 #include "Tables.h"
 
 #include <algorithm>
@@ -13,13 +15,6 @@ namespace gw {
 namespace {
 
 constexpr size_t kWorstFrames = 3;
-
-std::vector<std::string> NamesOf(const std::vector<BoneMeasures>& bones, std::string BoneMeasures::*side)
-{
-    std::vector<std::string> names;
-    std::ranges::transform(bones, std::back_inserter(names), side);
-    return names;
-}
 
 // The text around a fault's bone name and amount. All of it may be empty.
 struct FaultSentence
@@ -55,12 +50,6 @@ void AppendFault(CMarkup& page, const WorstFrame& worst)
         page.Raw(": ").Raw(worst.part);
 }
 
-// Returns the scale of the source in drawings: the ratio of the leg lengths, or 1 if a side has no legs.
-double SourceScale(const ConversionMeasures& sums)
-{
-    return sums.sourceLeg > 0.0 && sums.resultLeg > 0.0 ? sums.resultLeg / sums.sourceLeg : 1.0;
-}
-
 std::vector<float> Heights(const std::vector<Vec3>& places)
 {
     std::vector<float> heights;
@@ -76,8 +65,8 @@ void AddBothSides(Chart& chart, std::span<const float> source, std::span<const f
 
 } // namespace
 
-CConversionSection::CConversionSection(const ConvertedMotion& motion, size_t mostPoints)
-    : motion_(motion), m_uiMostPoints(mostPoints),
+CConversionSection::CConversionSection(const ConvertedMotion& motion, const SectionExtent& extent)
+    : motion_(motion), m_kExtent(extent),
       m_kWorst(FindWorstFrames(motion.measured->sums, motion.measured->detail, kWorstFrames))
 {
     for (const WorstFrame& worst : m_kWorst)
@@ -89,6 +78,8 @@ void CConversionSection::Append(CMarkup& page, const std::string& anchor)
     page.Raw("<section id=\"").Raw(anchor).Raw("\">\n");
     AppendHead(page);
     AppendTiles(page);
+    if (m_kExtent.hasPlayer)
+        AppendPlayer(page, motion_, m_kMarks);
     AppendWorstFrames(page);
     page.Raw("<h3>Over time</h3>\n<div class=\"charts\">\n");
     AppendCurves(page);
@@ -140,8 +131,8 @@ void CConversionSection::AppendTiles(CMarkup& page) const
 void CConversionSection::AppendWorstFrames(CMarkup& page) const
 {
     const ConversionMeasures& sums = motion_.measured->sums;
-    CFigurePoser source(motion_.sourceClip, NamesOf(sums.bones, &BoneMeasures::source));
-    CFigurePoser result(motion_.resultClip, NamesOf(sums.bones, &BoneMeasures::target));
+    CFigurePoser source(motion_.sourceClip, sums.bones, &BoneMeasures::source);
+    CFigurePoser result(motion_.resultClip, sums.bones, &BoneMeasures::target);
     if (!m_kWorst.empty())
         page.Raw("<h3>Worst frames</h3>\n<div class=\"worst\">\n");
     for (size_t i = 0; i < m_kWorst.size(); ++i)
@@ -172,17 +163,17 @@ void CConversionSection::AppendCurves(CMarkup& page) const
         chart.curves.push_back({"mean, default conversion", "other", motion_.plain->detail.meanError});
     chart.curves.push_back({"worst main bone", "most", detail.largestError});
     chart.curves.push_back({"mean of main bones", "result", detail.meanError});
-    AppendChart(page, chart, m_uiMostPoints);
+    AppendChart(page, chart, m_kExtent.mostPoints);
     Chart trunk = NewChart("Trunk error", "°");
     trunk.fromZero = true;
     trunk.curves.push_back({"hips to neck", "result", detail.trunkError});
-    AppendChart(page, trunk, m_uiMostPoints);
+    AppendChart(page, trunk, m_kExtent.mostPoints);
     AppendHipHeight(page);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendKnee(page, detail.feet[i], motion_.measured->sums.feet[i].target);
     for (size_t i = 0; i < detail.feet.size(); ++i)
         AppendSole(page, detail.feet[i], motion_.measured->sums.feet[i].target);
-    AppendPaths(page, detail.sourceHips, detail.resultHips, m_uiMostPoints);
+    AppendPaths(page, detail.sourceHips, detail.resultHips, m_kExtent.mostPoints);
 }
 
 Chart CConversionSection::NewChart(const std::string& title, std::string_view unit) const
@@ -199,7 +190,7 @@ void CConversionSection::AppendKnee(CMarkup& page, const FootDetail& foot, const
     Chart chart = NewChart("Knee above " + name, "°, 0 = straight");
     chart.fromZero = true;
     AddBothSides(chart, foot.sourceKnee, foot.resultKnee);
-    AppendChart(page, chart, m_uiMostPoints);
+    AppendChart(page, chart, m_kExtent.mostPoints);
 }
 
 void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const std::string& name) const
@@ -209,7 +200,7 @@ void CConversionSection::AppendSole(CMarkup& page, const FootDetail& foot, const
     AddBothSides(chart, foot.sourceSole, foot.resultSole);
     chart.strips.push_back({"source planted", "source", foot.sourceContacts});
     chart.strips.push_back({"result planted", "result", foot.resultContacts});
-    AppendChart(page, chart, m_uiMostPoints);
+    AppendChart(page, chart, m_kExtent.mostPoints);
 }
 
 void CConversionSection::AppendHipHeight(CMarkup& page) const
@@ -219,7 +210,7 @@ void CConversionSection::AppendHipHeight(CMarkup& page) const
     const std::vector<float> result = Heights(detail.resultHips);
     Chart chart = NewChart("Height of the hips", "mm above the floor");
     AddBothSides(chart, source, result);
-    AppendChart(page, chart, m_uiMostPoints);
+    AppendChart(page, chart, m_kExtent.mostPoints);
 }
 
 } // namespace gw

@@ -11,13 +11,19 @@
 
 namespace gw {
 
+/// How much of a conversion is shown.
+struct SectionExtent
+{
+    size_t mostPoints = 0;  ///< of a curve, about
+    bool hasPlayer = false; ///< with a player of both figures
+};
+
 /// The section of a page about one conversion: key figures, worst frames, curves, tables.
 class CConversionSection
 {
 public:
-    /// The conversion must outlive the section, and its trees are posed again. Curves are drawn with at most
-    /// about `mostPoints` points.
-    CConversionSection(const ConvertedMotion& motion, size_t mostPoints);
+    /// The conversion must outlive the section, and its trees are posed again.
+    CConversionSection(const ConvertedMotion& motion, const SectionExtent& extent);
 
     /// Appends the section; `anchor` is its link target.
     void Append(CMarkup& page, const std::string& anchor);
@@ -33,7 +39,7 @@ private:
     void AppendHipHeight(CMarkup& page) const;
 
     const ConvertedMotion& motion_;
-    size_t m_uiMostPoints;
+    SectionExtent m_kExtent;
     std::vector<WorstFrame> m_kWorst;
     std::vector<ChartMark> m_kMarks; // the positions of the worst frames
 };

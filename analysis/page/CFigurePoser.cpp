@@ -6,6 +6,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <unordered_map>
 
 namespace gw {
 
@@ -23,12 +24,12 @@ std::vector<CNode*> PathTo(CNode* node)
 }
 
 // Returns the lowest node at or above all named ones.
-CNode* CommonRoot(CNode* root, const std::vector<std::string>& bones)
+CNode* CommonRoot(CNode* root, const std::vector<BoneMeasures>& bones, std::string BoneMeasures::*name)
 {
     std::vector<CNode*> common;
-    for (const std::string& name : bones)
+    for (const BoneMeasures& bone : bones)
     {
-        const std::vector<CNode*> path = PathTo(FindNode(root, name.c_str()));
+        const std::vector<CNode*> path = PathTo(FindNode(root, (bone.*name).c_str()));
         if (path.empty())
             continue;
         if (common.empty())
@@ -44,12 +45,16 @@ bool IsFinite(const Vec3& v)
 }
 
 // Returns the end of a bone without an end joint.
-std::optional<Vec3> FreeEnd(const CNode& node)
+Vec3 FreeEnd(const CNode& node)
 {
-    const CBoneMesh* mesh = FindBoneMesh(node);
-    if (!mesh || mesh->m_fLength <= 0.0f || !node.HasNoNodeChild())
-        return std::nullopt;
+    const CBoneMesh* const mesh = FindBoneMesh(node);
     return TransformCoord(mesh->Axis() * mesh->m_fLength, mesh->m_kMatrix * node.m_kWorldMatrix);
+}
+
+bool HasFreeEnd(const CNode& node)
+{
+    const CBoneMesh* const mesh = FindBoneMesh(node);
+    return mesh && mesh->m_fLength > 0.0f && node.HasNoNodeChild();
 }
 
 // Returns the joints above the faulty bones, starting with the one that shows the fault.
@@ -63,31 +68,60 @@ std::vector<const CNode*> BadJoints(EFrameFault fault, const CNode* bone)
 
 } // namespace
 
-CFigurePoser::CFigurePoser(const MotionClip& clip, const std::vector<std::string>& bones)
-    : m_pkTreeRoot(clip.root), m_pkRoot(CommonRoot(clip.root, bones)), m_kNodes(NodesOf(*m_pkRoot)),
+CFigurePoser::CFigurePoser(const MotionClip& clip, const std::vector<BoneMeasures>& bones,
+                           std::string BoneMeasures::*name)
+    : m_pkTreeRoot(clip.root), m_pkRoot(CommonRoot(clip.root, bones, name)), m_kNodes(NodesOf(*m_pkRoot)),
       m_kSampler(clip.frequency)
 {
     m_kNodes.resize(std::min(m_kNodes.size(), kMostJoints));
+    const std::vector<EFigureSide> sides = FigureSides(m_kNodes, bones, name);
+    std::unordered_map<const CNode*, size_t> indices;
     for (CNode* node : m_kNodes)
+    {
         m_kSampler.Watch(node);
+        const size_t index = indices.size();
+        indices[node] = index;
+        if (node != m_pkRoot)
+            m_kBones.push_back(
+                {indices[node->GetParentNode()], index, sides[indices[node->GetParentNode()]]});
+    }
+    for (size_t i = 0; i < m_kNodes.size(); ++i)
+    {
+        if (!HasFreeEnd(*m_kNodes[i]))
+            continue;
+        m_kBones.push_back({i, m_kNodes.size() + m_kTips.size(), sides[i]});
+        m_kTips.push_back(m_kNodes[i]);
+    }
+}
+
+std::vector<Vec3> CFigurePoser::CurrentPoints() const
+{
+    std::vector<Vec3> points;
+    points.reserve(m_kNodes.size() + m_kTips.size());
+    for (const CNode* node : m_kNodes)
+        points.push_back(node->m_kWorldMatrix.Translation());
+    for (const CNode* node : m_kTips)
+        points.push_back(FreeEnd(*node));
+    return points;
+}
+
+std::vector<Vec3> CFigurePoser::Points(double frame)
+{
+    m_kSampler.Pose(frame);
+    return CurrentPoints();
 }
 
 PosedFigure CFigurePoser::Pose(double frame, EFrameFault fault, const std::string& bone)
 {
-    m_kSampler.Pose(frame);
+    const std::vector<Vec3> points = Points(frame);
     const std::vector<const CNode*> bad = BadJoints(fault, FindNode(m_pkTreeRoot, bone.c_str()));
     PosedFigure figure;
-    const auto addLine = [&](const CNode* joint, const Vec3& end) {
-        const Vec3 start = joint->m_kWorldMatrix.Translation();
-        if (IsFinite(start) && IsFinite(end))
-            (std::ranges::count(bad, joint) ? figure.badLines : figure.lines).push_back({start, end});
-    };
-    for (const CNode* node : m_kNodes)
+    for (const FigureBone& line : m_kBones)
     {
-        if (node != m_pkRoot)
-            addLine(node->GetParentNode(), node->m_kWorldMatrix.Translation());
-        if (const std::optional<Vec3> end = FreeEnd(*node))
-            addLine(node, *end);
+        const std::array ends{points[line.from], points[line.to]};
+        if (IsFinite(ends[0]) && IsFinite(ends[1]))
+            (std::ranges::count(bad, m_kNodes[line.from]) ? figure.badLines : figure.lines)
+                .push_back({ends, line.side});
     }
     if (bad.front() && IsFinite(bad.front()->m_kWorldMatrix.Translation()))
         figure.badJoint = bad.front()->m_kWorldMatrix.Translation();

@@ -53,6 +53,38 @@ CMarkup& CMarkup::FileName(std::string_view path)
     return Raw("<span title=\"").Name(path).Raw("\">").Name(parts.stem + parts.extension).Raw("</span>");
 }
 
+CMarkup& CMarkup::JsonText(std::string_view text)
+{
+    m_kText += '"';
+    for (const char c : Printable(text.substr(0, kLongestName)))
+    {
+        constexpr const char* kDigits = "0123456789abcdef";
+        if (c == '"' || c == '\\' || !EscapeOf(c).empty())
+            Raw("\\u00").Raw({&kDigits[c >> 4], 1}).Raw({&kDigits[c & 15], 1});
+        else
+            m_kText += c;
+    }
+    m_kText += '"';
+    return *this;
+}
+
+CMarkup& CMarkup::Base64(std::string_view bytes)
+{
+    constexpr const char* kDigits = "ABCDEFGHIJKLMNOPQRSTUVWXYZabcdefghijklmnopqrstuvwxyz0123456789+/";
+    for (size_t i = 0; i < bytes.size(); i += 3)
+    {
+        const auto byte = [&](size_t at) {
+            return at < bytes.size() ? static_cast<unsigned>(static_cast<unsigned char>(bytes[at])) : 0u;
+        };
+        const unsigned bits = byte(i) << 16 | byte(i + 1) << 8 | byte(i + 2);
+        m_kText += kDigits[bits >> 18];
+        m_kText += kDigits[bits >> 12 & 63];
+        m_kText += i + 1 < bytes.size() ? kDigits[bits >> 6 & 63] : '=';
+        m_kText += i + 2 < bytes.size() ? kDigits[bits & 63] : '=';
+    }
+    return *this;
+}
+
 CMarkup& CMarkup::Number(double value, int decimals)
 {
     AppendFixed(m_kText, value, decimals);

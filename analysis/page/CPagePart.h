@@ -8,39 +8,30 @@ namespace gw {
 
 struct ConvertedMotion;
 
-/// The page's content for one conversion. It is created in the process that has the conversion's trees, and
-/// can be sent as text to the process that writes the page.
+/// The details of one conversion on a page. They are drawn in the process that has the conversion's trees,
+/// and can be sent as text to the process that writes the page.
 class CPagePart
 {
 public:
-    /// `number` identifies the conversion on the page, starting at 1. `motionCount` is the total number of
-    /// conversions: the more there are, the coarser the curves, so that a browser can still open the page.
-    CPagePart(size_t number, size_t motionCount);
+    /// `number` identifies the source on the page, starting at 1. `detailCount` is the number of conversions
+    /// that are shown in detail: the more there are, the coarser the curves, so that a browser can still open
+    /// the page. A single one gets a player of both figures.
+    CPagePart(size_t number, size_t detailCount) : m_uiNumber(number), m_uiDetailCount(detailCount) {}
 
     /// Draws a conversion. Its trees are posed again.
     void Show(const ConvertedMotion& motion);
 
+    size_t Number() const { return m_uiNumber; }
     /// Returns whether a conversion was drawn.
     bool HasFigures() const { return !m_kSection.empty(); }
-    /// Returns the conversion's row in the overview table.
-    const std::string& Row() const { return m_kRow; }
-    /// Returns the section about the conversion.
+    /// Returns the section about the conversion; empty if none was drawn.
     const std::string& Section() const { return m_kSection; }
-    /// Returns a score for ranking conversions: larger is worse.
-    double Badness() const { return m_fBadness; }
-
-    /// Returns the part as text for FromText; empty for one without figures.
-    std::string ToText() const;
-    /// Restores a part from ToText. Returns false for any other text.
-    bool FromText(std::string_view text);
+    /// Restores a section that was drawn in another process.
+    void SetSection(std::string_view section) { m_kSection = section; }
 
 private:
-    std::string SummaryRow(const ConvertedMotion& motion, const std::string& anchor);
-
     size_t m_uiNumber;
-    size_t m_uiMotionCount;
-    double m_fBadness = 0.0;
-    std::string m_kRow;
+    size_t m_uiDetailCount;
     std::string m_kSection;
 };
 

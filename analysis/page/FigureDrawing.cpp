@@ -35,7 +35,7 @@ void EachPoint(const FigurePair& pair, const Visit& visit)
         for (const std::vector<PosedFigure::Line>* lines : {&figure->lines, &figure->badLines})
         {
             for (const PosedFigure::Line& line : *lines)
-                std::ranges::for_each(line, visit);
+                std::ranges::for_each(line.ends, visit);
         }
     }
 }
@@ -72,15 +72,20 @@ void AppendPoint(CMarkup& page, const Look& look, const Vec3& point)
 void AppendLines(CMarkup& page, const Look& look, const std::vector<PosedFigure::Line>& lines,
                  std::string_view style)
 {
-    page.Raw("<path class=\"").Raw(style).Raw("\" d=\"");
-    for (const PosedFigure::Line& line : lines)
+    for (const EFigureSide side : {EFigureSide::Right, EFigureSide::Middle, EFigureSide::Left})
     {
-        page.Raw("M");
-        AppendPoint(page, look, line[0]);
-        page.Raw("L");
-        AppendPoint(page, look, line[1]);
+        page.Raw("<path class=\"").Raw(style).Raw(" ").Raw(FigureSideName(side)).Raw("\" d=\"");
+        for (const PosedFigure::Line& line : lines)
+        {
+            if (line.side != side)
+                continue;
+            page.Raw("M");
+            AppendPoint(page, look, line.ends[0]);
+            page.Raw("L");
+            AppendPoint(page, look, line.ends[1]);
+        }
+        page.Raw("\"/>");
     }
-    page.Raw("\"/>");
 }
 
 void AppendFigure(CMarkup& page, const Look& look, const PosedFigure& figure, std::string_view side,
@@ -108,7 +113,7 @@ void PlaceFigure(PosedFigure& figure, double floor, double scale)
     for (std::vector<PosedFigure::Line>* lines : {&figure.lines, &figure.badLines})
     {
         for (PosedFigure::Line& line : *lines)
-            std::ranges::for_each(line, place);
+            std::ranges::for_each(line.ends, place);
     }
     if (figure.badJoint)
         place(*figure.badJoint);

@@ -200,10 +200,18 @@ size_t KeyFigureCount()
 
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail)
 {
+    std::vector<Optional> values;
+    for (const KeyRow& row : kRows)
+        values.push_back(row.value(measures, detail));
+    return KeyFiguresFrom(values);
+}
+
+std::vector<KeyFigure> KeyFiguresFrom(std::span<const std::optional<double>> values)
+{
     std::vector<KeyFigure> figures;
     for (const KeyRow& row : kRows)
     {
-        const Optional value = row.value(measures, detail);
+        const Optional value = figures.size() < values.size() ? values[figures.size()] : std::nullopt;
         figures.push_back({row.key, row.label, row.unit, row.decimals, value, VerdictOf(row, value),
                            MarkOf(row), row.meaning});
     }

@@ -3,6 +3,7 @@
 #include <cstddef>
 #include <cstdint>
 #include <optional>
+#include <span>
 #include <string>
 #include <string_view>
 #include <vector>
@@ -39,6 +40,9 @@ struct KeyFigure
 size_t KeyFigureCount();
 /// Returns all key figures, always the same ones in the same order.
 std::vector<KeyFigure> KeyFiguresOf(const ConversionMeasures& measures, const ConversionDetail& detail);
+
+/// Returns the same with given values, in their order; missing ones have no value.
+std::vector<KeyFigure> KeyFiguresFrom(std::span<const std::optional<double>> values);
 
 /// Returns a score for ranking conversions: larger is worse. One poor figure outweighs any number of fair
 /// ones, and one fair figure outweighs the value of the first figure.

@@ -40,3 +40,27 @@ class Picture:
         part = self.rows[int(top * self.height):int(bottom * self.height)]
         ground = self.rows[0][:3]
         return sum(row[3 * x:3 * x + 3] != ground for row in part for x in columns)
+
+    def colored(self, left, top, right, bottom):
+        """How many pixels of a part are of the colors of a side: limbs, but neither trunk nor floor."""
+        columns = range(int(left * self.width), int(right * self.width))
+        part = self.rows[int(top * self.height):int(bottom * self.height)]
+        return sum(abs(row[3 * x] - row[3 * x + 1]) > 60 for row in part for x in columns)
+
+
+def differing(rows, others):
+    """The share of bytes that differ by more than another rounding of a smooth edge does."""
+    pairs = [pair for row, other in zip(rows, others) for pair in zip(row, other)]
+    return sum(abs(a - b) > 64 for a, b in pairs) / len(pairs)
+
+
+def chunks(content):
+    """The names and contents of a PNG's chunks, whose checksums are checked."""
+    found, at = [], 8
+    while at < len(content):
+        size, name = struct.unpack(">I4s", content[at:at + 8])
+        body = content[at + 8:at + 8 + size]
+        assert struct.unpack(">I", content[at + 8 + size:at + 12 + size])[0] == zlib.crc32(name + body), name
+        found.append((name.decode(), body))
+        at += size + 12
+    return found

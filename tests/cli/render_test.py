@@ -4,7 +4,7 @@ import shutil
 
 from harness import DONE, FAILED, PROGRAM, USAGE, WALK, CliTest, main
 from made import BVH, Container
-from picture import Picture
+from picture import Picture, chunks, differing
 
 LEFT, RIGHT = (0, 0, 0.5, 1), (0.5, 0, 1, 1)
 SIZE = ("--size", "160x120")
@@ -25,8 +25,8 @@ class Pictures(CliTest):
             picture = self.render(WALK, *arguments)
             self.assertEqual((picture.width, picture.height), size)
             self.assertEqual((self.facts["width"], self.facts["height"]), size)
-            self.assertGreater(picture.drawn(0.3, 0, 0.7, 1), 100)
-            self.assertEqual(picture.drawn(0, 0, 0.2, 1), 0)
+            self.assertGreater(picture.colored(0.3, 0.2, 0.7, 1), 50)
+            self.assertEqual(picture.colored(0, 0.2, 0.2, 1), 0)
 
     def test_frames_look_different_and_those_behind_the_end_like_the_end(self):
         rows = [(frame, self.render(WALK, *SIZE, "--frame=%d" % frame).rows, self.facts["frame"])
@@ -40,27 +40,47 @@ class Pictures(CliTest):
 
     def test_a_result_stands_beside_its_source_whatever_file_it_lies_in(self):
         alone = self.render(WALK, *SIZE)
-        self.assertEqual(max(alone.drawn(0, 0, 0.3, 1), alone.drawn(0.7, 0, 1, 1)), 0)
+        self.assertEqual(max(alone.colored(0, 0.3, 0.3, 1), alone.colored(0.7, 0.3, 1, 1)), 0)
         halves = []
         for name in ("walk.htr", "walk.Kinetra"):
             self.succeed("convert", WALK, "-o", name)
             both = self.render(WALK, *SIZE, "--with", name)
-            self.assertGreater(min(both.drawn(*LEFT), both.drawn(*RIGHT)), 50)
+            self.assertGreater(min(both.colored(*LEFT), both.colored(*RIGHT)), 30)
             halves.append([row[240:] for row in both.rows])
         self.assertEqual(halves[0], halves[1])
         result = self.render("walk.Kinetra", "--size", "80x120")
         self.assertEqual(result.rows, halves[0])
 
     def test_a_strip_shows_the_way_from_the_frame_to_the_end(self):
-        strip = self.render(WALK, "--size", "400x120", "--strip", 4, "--frame", 6)
+        strip = self.render(WALK, "--size", "400x90", "--strip", 4, "--frame", 6)
         self.assertEqual((self.facts["poses"], self.facts["frame"]), (4, 6))
         poses = [[row[300 * i:300 * (i + 1)] for row in strip.rows] for i in range(4)]
         for i in range(4):
-            self.assertGreater(strip.drawn(i / 4, 0, (i + 1) / 4, 1), 50)
+            self.assertGreater(strip.colored(i / 4, 0, (i + 1) / 4, 1), 30)
         self.assertEqual(len({str(pose) for pose in poses}), 4)
-        two = self.render(WALK, "--size", "400x240", "--strip", 4, "--frame", 6, "--with", WALK)
-        self.assertEqual(two.rows[:120], strip.rows)
-        self.assertEqual(two.rows[120:], strip.rows)
+        two = self.render(WALK, "--size", "400x180", "--strip", 4, "--frame", 6, "--with", WALK)
+        for half in (two.rows[:90], two.rows[90:]):
+            self.assertLess(differing(half, strip.rows), 0.002)
+
+    def test_a_picture_has_views_a_background_axes_and_labels(self):
+        pictures = [self.render(WALK, *SIZE, *options).rows for options in
+                    ((), ("--view", "side"), ("--view", "three-quarter"), ("--view", "top"), ("--axes",),
+                     ("--background", "dark"), ("--frame", 3))]
+        self.assertEqual(len({str(rows) for rows in pictures}), len(pictures))
+        self.assertEqual([tuple(pictures[i][0][-3:]) for i in (0, 5)], [(0xfb, 0xfb, 0xf9), (0x15, 0x18, 0x1a)])
+        self.assertEqual(self.render(WALK, *SIZE, "--upright").rows, pictures[0], "Y is up already")
+
+    def test_an_animation_has_a_picture_for_each_moment(self):
+        still = self.render(WALK, *SIZE, "--frame", 60)
+        shown = self.with_assets("render", WALK, "--animate", "moves.png", *SIZE, "--frame", 60, "--json")
+        self.assertEqual((shown.code, json.loads(shown.out)["pictures"]), (DONE, 7), shown.err)
+        content = self.read("moves.png")
+        self.assertEqual(Picture(content).width, still.width)
+        found = chunks(content)
+        self.assertEqual([name for name, _ in found].count("fcTL"), 7)
+        numbers = [body[:4] for name, body in found if name in ("fcTL", "fdAT")]
+        self.assertEqual(numbers, [number.to_bytes(4, "big") for number in range(len(numbers))])
+
 
 class Refusals(CliTest):
     def test_what_is_no_picture_is_refused_before_anything_is_written(self):
@@ -73,6 +93,9 @@ class Refusals(CliTest):
             ("no pose", USAGE, ["take.bvh", "--strip", "0"], ["--strip 0"]),
             ("more poses than pixels", USAGE, ["take.bvh", "--size", "9x9", "--strip", "10"], ["10 poses", "9x9"]),
             ("another kind of picture", USAGE, ["take.bvh", "-o", "out.jpg"], ["out.jpg", ".png"]),
+            ("a picture and an animation", USAGE, ["take.bvh", "-o", "a.png", "--animate", "b.png"], ["--animate"]),
+            ("a strip that moves", USAGE, ["take.bvh", "--animate", "b.png", "--strip", "3"], ["--strip"]),
+            ("no such view", USAGE, ["take.bvh", "--view", "back"], ["back", "three-quarter"]),
             ("contrary wishes", USAGE, ["take.bvh", "--force", "--skip-existing"], ["cannot be combined"]),
             ("a picture that is there", FAILED, ["take.bvh", "-o", "old.png"], ["old.png", "--force"]),
             ("no such motion", FAILED, ["none.bvh"], ["none.bvh"]),
@@ -82,7 +105,7 @@ class Refusals(CliTest):
         before = self.files()
         for what, code, arguments, words in rows:
             with self.subTest(what):
-                output = [] if "-o" in arguments else ["-o", "out.png"]
+                output = [] if {"-o", "--animate"} & {*arguments} else ["-o", "out.png"]
                 result = self.run_program("render", *arguments, *output)
                 self.assertEqual((result.code, result.out), (code, ""), result.err)
                 if "without a display" not in result.err:

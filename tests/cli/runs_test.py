@@ -306,8 +306,9 @@ class Resumed(RunTest):
             self.convert("--keep-going", "--force", "--jobs", jobs, "--html", "page.html")
             pages.append(self.read("page.html").decode())
         self.assertEqual(pages[0], pages[1])
-        self.assertEqual(pages[0].count("<section id=\"motion"), TAKES - 1)
-        self.assertIn(">failed<", pages[0])
+        self.assertEqual(pages[0].count("<section id=\"motion"), 20)
+        self.assertEqual(pages[0].count(".bvh\",0,0,67,"), TAKES - 1)
+        self.assertIn("Failed: 1<", pages[0])
 
 
 class Shown(RunTest):

@@ -2,6 +2,7 @@
 
 #include "RenderPicture.h"
 #include "PreviewScene.h"
+#include "UprightPoint.h"
 
 #include <gtest/gtest.h>
 
@@ -47,6 +48,40 @@ TEST(RenderPicture, ShowsAllMotionsAtTheSameShare)
         EXPECT_EQ(DrawnTimes(sourceKeeper, poses), sourceTimes);
         EXPECT_EQ(DrawnTimes(resultKeeper, poses), resultTimes);
         EXPECT_EQ(CountColor(picture, {0, 0, 0}), 0) << "a part that was not drawn";
+    }
+}
+
+TEST(RenderPicture, SeesAFigureFromFourSides)
+{
+    const Vec3 left{1, 0, 0}; // so the figure faces +z
+    const struct
+    {
+        const char* what;
+        EPictureView view;
+        Vec3 forward; ///< where a point ahead of the figure is seen; the last number is nearness
+        Vec3 upward;
+    } rows[] = {
+        {"front: ahead is near and slightly low", EPictureView::Front, {0, -0.14f, 0.99f}, {0, 0.99f, 0.14f}},
+        {"side: ahead is to the right", EPictureView::Side, {1, 0, 0}, {0, 0.99f, 0.14f}},
+        {"top: ahead is below, and up is near", EPictureView::Top, {0, -1, 0}, {0, 0, 1}},
+    };
+    for (const auto& row : rows)
+    {
+        SCOPED_TRACE(row.what);
+        const CPictureCamera camera(row.view, left);
+        EXPECT_LT(Vec3Length(camera.Project({5, 5, 6}, {5, 5, 5}) - row.forward), 0.01);
+        EXPECT_LT(Vec3Length(camera.Project({5, 6, 5}, {5, 5, 5}) - row.upward), 0.01);
+    }
+}
+
+TEST(RenderPicture, TurnsAnyAxisUprightWithoutMirroring)
+{
+    const Vec3 axes[] = {{0, 1, 0}, {0, -1, 0}, {0, 0, 1}, {0, 0, -1}, {1, 0, 0}, {-1, 0, 0}};
+    for (const Vec3& up : axes)
+    {
+        EXPECT_EQ(UprightPoint(up, up), kVec3UnitY);
+        const Vec3 x = UprightPoint(kVec3UnitX, up);
+        EXPECT_EQ(Vec3Cross(x, UprightPoint(kVec3UnitY, up)), UprightPoint(kVec3UnitZ, up));
     }
 }
 

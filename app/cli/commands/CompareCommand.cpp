@@ -114,7 +114,8 @@ bool WriteComparison(const ShellOptions& options, const std::string& profilePath
     CPagePart part(1, 1);
     part.Show(motion);
     CConversionPage page;
-    page.Add(motion.source, part);
+    page.Add({.source = motion.source});
+    page.AddDetails(part);
     return WritePage(options, page);
 }
 

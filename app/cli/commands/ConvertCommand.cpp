@@ -69,7 +69,8 @@ EExit RunOne(const ShellOptions& options, const ConversionJob& job)
     if (part && part->HasFigures())
     {
         CConversionPage page;
-        page.Add(job.source, *part);
+        page.Add({.source = job.source});
+        page.AddDetails(*part);
         isWritten = WritePage(options, page);
     }
     return outcome == EConversion::Failed || !isWritten ? EExit::Failed : EExit::Done;

@@ -1,6 +1,8 @@
 // `merge-report`: joins the reports of a plan's shards. Lines are matched to the plan by output, so the order
 // of the reports does not matter, and a source reported twice counts with its last line.
 
+#include "CConversionPage.h"
+#include "CDraftShelf.h"
 #include "CMappedFile.h"
 #include "CRunSummary.h"
 #include "CSafeFile.h"
@@ -9,7 +11,12 @@
 #include "NoticeJson.h"
 #include "OptionJson.h"
 #include "Output.h"
+#include "PageOutput.h"
+#include "PageOutputDetails.h"
+#include "PageOutputRow.h"
+#include "Paths.h"
 #include "PlanFile.h"
+#include "RunSetup.h"
 #include "RunTally.h"
 #include "SystemError.h"
 #include "Text.h"
@@ -17,6 +24,7 @@
 
 #include <algorithm>
 #include <cstdio>
+#include <optional>
 #include <unordered_map>
 
 namespace gw {
@@ -89,7 +97,7 @@ void SayNotices(const ShellOptions& options, const std::string& line)
 
 // Sorts the lines in plan order and counts their results.
 std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines& lines, RunTally& tally,
-                 CRunSummary& summary)
+                 CRunSummary& summary, CConversionPage& page)
 {
     std::string joined;
     for (const CRunPlan::Entry& entry : plan.entries)
@@ -98,11 +106,13 @@ std::string Join(const ShellOptions& options, const CRunPlan& plan, const Lines&
         if (found == lines.end())
         {
             ++tally.left;
+            page.Add({.source = entry.source, .outcome = "left"});
             continue;
         }
         ++tally[found->second.outcome];
         joined += found->second.text + '\n';
         summary.Take(entry.source, found->second.outcome, found->second.text);
+        page.Add(PageRowOf(entry.source, OutcomeName(found->second.outcome), found->second.text));
         if (options.verbose)
             SayNotices(options, found->second.text);
     }
@@ -136,25 +146,49 @@ bool Write(const ShellOptions& options, const std::string& joined)
     return false;
 }
 
+// Draws what can be drawn here: sources that another machine alone has get no details.
+bool WriteRunPage(const ShellOptions& planned, const CRunPlan& plan, CConversionPage& page)
+{
+    std::vector<ConversionJob> jobs;
+    for (const CRunPlan::Entry& entry : plan.entries)
+        jobs.push_back({entry.source, entry.output});
+    std::optional<CDraftShelf> drafts;
+    if (planned.draft)
+    {
+        const std::string folder =
+            plan.outputFolder.empty() ? SplitPath(planned.files[0]).folder : plan.outputFolder;
+        drafts.emplace(planned.drafts.empty() ? ResumeDrafts(folder) : planned.drafts, jobs.size());
+        for (size_t job = 0; job < jobs.size(); ++job)
+            drafts->Settle(job); // the shards have kept their drafts
+    }
+    AddPageDetails(planned, jobs, drafts ? &*drafts : nullptr, page);
+    return WritePage(planned, page);
+}
+
 } // namespace
 
 EExit RunMergeReport(const ShellOptions& options)
 {
+    if (const EExit page = CheckPagePath(options); page != EExit::Done)
+        return page;
     CRunPlan plan;
     Lines lines;
-    if (!LoadPlan(options.files[0], plan) || !ReadReports(options, plan, lines))
+    if (!HasPageFolder(options) || !LoadPlan(options.files[0], plan) || !ReadReports(options, plan, lines))
         return EExit::Failed;
     if (!options.output.empty() && !MayWrite(options, options.output))
         return EExit::Failed;
     RunTally tally;
     CRunSummary summary;
-    if (!Write(options, Join(options, plan, lines, tally, summary)))
+    CConversionPage page;
+    if (!Write(options, Join(options, plan, lines, tally, summary, page)))
         return EExit::Failed;
     SayLeft(plan, lines);
     std::string wrong;
     ShellOptions planned = options; // the summary depends on the options of the run
     ReadOptionsJson(plan.options, ~kHowToRun, planned, wrong);
     summary.Tell(planned, tally, options.verbose);
+    if (IsPageAsked(options) && !WriteRunPage(planned, plan, page))
+        return EExit::Failed;
     return tally[EConversion::Failed] + tally.left == 0 ? EExit::Done : EExit::Failed;
 }
 

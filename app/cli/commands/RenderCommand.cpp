@@ -8,6 +8,7 @@
 #include "PackageBlocks.h"
 #include "PackagedMotion.h"
 #include "Paths.h"
+#include "PictureSides.h"
 #include "RenderPicture.h"
 #include "SourceTiming.h"
 #include "Text.h"
@@ -15,6 +16,7 @@
 #include "WritePng.h"
 
 #include <algorithm>
+#include <cmath>
 #include <cstdio>
 #include <limits>
 
@@ -22,9 +24,28 @@ namespace gw {
 
 namespace {
 
+constexpr int kMostFrames = 1800; // of an animation: a minute at 30 per second, some 50 MB
+
 PictureMotion Shown(CNode* root, const SourceTiming& timing)
 {
-    return {Ref<CNode>(root), timing.FrameStep(), timing.lastFrame};
+    return {.root = Ref<CNode>(root), .frameStep = timing.FrameStep(), .lastFrame = timing.lastFrame};
+}
+
+// The scene's time between two frames is the reciprocal of the frame time.
+float FrameSeconds(const PictureMotion& motion)
+{
+    return motion.frameStep > 0.0f ? 1.0f / motion.frameStep : 0.0f;
+}
+
+EPictureView ViewOf(const ShellOptions& options)
+{
+    constexpr const char* kNames[] = {"front", "side", "three-quarter", "top"}; // indexed by EPictureView
+    return static_cast<EPictureView>(std::ranges::find(kNames, options.view) - std::begin(kNames));
+}
+
+const std::string& OutputOf(const ShellOptions& options)
+{
+    return options.animate.empty() ? options.output : options.animate;
 }
 
 // Shows the first root that moves, animated by its first track, with bone meshes added so that its bones are
@@ -62,6 +83,16 @@ bool LoadMotion(const ShellOptions& options, const std::string& path, PictureMot
     return true;
 }
 
+bool LoadPosed(const ShellOptions& options, const std::string& path, PictureMotion& motion)
+{
+    if (!LoadMotion(options, path, motion))
+        return false;
+    const PathParts parts = SplitPath(path);
+    motion.label = Printable(parts.stem + parts.extension);
+    FindPictureSides(motion, options.upright, FrameSeconds(motion));
+    return true;
+}
+
 int ToInt(int64_t number)
 {
     using Limits = std::numeric_limits<int>;
@@ -77,6 +108,9 @@ PictureOptions PictureOf(const ShellOptions& options)
     picture.height = options.size.height;
     picture.frame = ToInt(options.frame);
     picture.poseCount = ToInt(options.strip);
+    picture.view = ViewOf(options);
+    picture.isDark = options.background == "dark";
+    picture.hasAxes = options.axes;
     return picture;
 }
 
@@ -87,8 +121,10 @@ std::string SizeText(const PictureOptions& picture)
 
 bool CanDraw(const ShellOptions& options, const PictureOptions& picture)
 {
-    if (!HasExtension(options.output, ".png"))
-        return Refuse(Printable(options.output) + ": the picture must be a .png file");
+    if (!HasExtension(OutputOf(options), ".png"))
+        return Refuse(Printable(OutputOf(options)) + ": the picture must be a .png file");
+    if (!options.animate.empty() && options.strip != 1)
+        return Refuse("--animate and --strip cannot be combined");
     if (picture.poseCount < 1)
         return Refuse("--strip " + std::to_string(options.strip) + ": a picture needs at least one pose");
     const std::string poses = picture.poseCount == 1 ? "a pose" : std::to_string(options.strip) + " poses";
@@ -97,13 +133,27 @@ bool CanDraw(const ShellOptions& options, const PictureOptions& picture)
                   std::to_string(kLongestSide) + ", and each pose needs at least one pixel");
 }
 
+// Returns the frames of an animation: at most 30 per second, and at most kMostFrames.
+PngAnimation AnimationOf(const PictureOptions& picture)
+{
+    const PictureMotion& motion = picture.motions.front();
+    const auto seconds = static_cast<double>(FrameSeconds(motion));
+    const bool isRateKnown = seconds > 0.001 && seconds < 10.0;
+    PngAnimation animation;
+    animation.stride = isRateKnown ? std::max(1, static_cast<int>(std::lround(1.0 / (30.0 * seconds)))) : 1;
+    animation.secondsPerFrame = isRateKnown ? seconds * animation.stride : 1.0 / 30.0;
+    const int64_t count = (LastFrame(motion) - FirstFrame(picture)) / animation.stride + 1;
+    animation.frameCount = static_cast<int>(std::min<int64_t>(count, kMostFrames));
+    return animation;
+}
+
 // `picture` is null if none was drawn.
 void WriteJson(const ShellOptions& options, const PictureOptions* picture)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
     json.Key("source").Text(options.files[0]);
-    json.Key("output").Text(options.output);
+    json.Key("output").Text(OutputOf(options));
     json.Key("outcome").Text(picture ? "drawn" : "skipped");
     if (picture)
     {
@@ -111,13 +161,22 @@ void WriteJson(const ShellOptions& options, const PictureOptions* picture)
         json.Key("height").Integer(picture->height);
         json.Key("frame").Integer(picture->frame);
         json.Key("poses").Integer(picture->poseCount);
+        if (!options.animate.empty())
+            json.Key("pictures").Integer(AnimationOf(*picture).frameCount);
     }
     json.EndObject();
     json.EndDocument();
 }
 
-std::string PictureWords(const PictureOptions& picture)
+std::string PictureWords(const ShellOptions& options, const PictureOptions& picture)
 {
+    if (!options.animate.empty())
+    {
+        const PngAnimation animation = AnimationOf(picture);
+        const bool isCut = animation.frameCount == kMostFrames;
+        return SizeText(picture) + " pixels, " + std::to_string(animation.frameCount) + " pictures" +
+               (isCut ? ", the most that an animation has" : "");
+    }
     const std::string frame = std::to_string(picture.frame);
     const std::string poses = picture.poseCount == 1
                                   ? "frame " + frame
@@ -127,25 +186,28 @@ std::string PictureWords(const PictureOptions& picture)
 
 EExit Tell(const ShellOptions& options, const PictureOptions* picture)
 {
-    const std::string words = picture ? PictureWords(*picture) : "skipped, the output exists";
+    const std::string words = picture ? PictureWords(options, *picture) : "skipped, the output exists";
     if (options.json)
         WriteJson(options, picture);
     else if (!options.quiet)
-        std::printf("%s -> %s: %s\n", Printable(options.files[0]).c_str(), Printable(options.output).c_str(),
-                    words.c_str());
+        std::printf("%s -> %s: %s\n", Printable(options.files[0]).c_str(),
+                    Printable(OutputOf(options)).c_str(), words.c_str());
     return EExit::Done;
 }
 
-bool Draw(const PictureOptions& options, const std::string& output)
+bool Draw(const ShellOptions& shell, const PictureOptions& options)
 {
     RgbPicture picture;
-    const EPictureAnswer answer = RenderPicture(options, picture);
+    const std::string& output = OutputOf(shell);
+    const bool isAnimated = !shell.animate.empty();
+    const EPictureAnswer answer =
+        isAnimated ? WriteAnimation(output, options, AnimationOf(options)) : RenderPicture(options, picture);
     if (answer == EPictureAnswer::NoPainter)
         return Refuse(
             "drawing needs gw_picture_painter.so next to the program, and the libraries that it loads");
-    if (answer != EPictureAnswer::Done)
+    if (answer != EPictureAnswer::Done && answer != EPictureAnswer::Stopped)
         return Refuse("the OpenGL driver cannot draw this picture without a display; Mesa's driver can");
-    if (WritePng(output, picture))
+    if (isAnimated ? answer == EPictureAnswer::Done : WritePng(output, picture))
         return true;
     SayNotWritten(output);
     return false;
@@ -158,14 +220,14 @@ EExit RunRender(const ShellOptions& options)
     PictureOptions picture = PictureOf(options);
     if (!IsDecidedOnExisting(options) || !CanDraw(options, picture))
         return EExit::Usage;
-    if (options.skipExisting && IsTaken(options.output))
+    if (options.skipExisting && IsTaken(OutputOf(options)))
         return Tell(options, nullptr);
-    if (!MayWrite(options, options.output) || !LoadMotion(options, options.files[0], picture.motions[0]))
+    if (!MayWrite(options, OutputOf(options)) || !LoadPosed(options, options.files[0], picture.motions[0]))
         return EExit::Failed;
-    if (!options.with.empty() && !LoadMotion(options, options.with, picture.motions[1]))
+    if (!options.with.empty() && !LoadPosed(options, options.with, picture.motions[1]))
         return EExit::Failed;
     picture.frame = FirstFrame(picture);
-    return Draw(picture, options.output) ? Tell(options, &picture) : EExit::Failed;
+    return Draw(options, picture) ? Tell(options, &picture) : EExit::Failed;
 }
 
 } // namespace gw

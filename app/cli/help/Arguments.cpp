@@ -142,7 +142,10 @@ size_t CountChosen(const CLI::App& app, const ShellCommand& command)
 {
     size_t chosen = 0;
     for (const OptionRow& row : OptionTable())
-        chosen += command.choice & row.bit && app.count(std::string(row.names)) > 0 ? 1 : 0;
+        chosen +=
+            command.choice & row.bit && app.count(std::string(row.names.substr(0, row.names.find(',')))) > 0
+                ? 1
+                : 0;
     return chosen;
 }
 

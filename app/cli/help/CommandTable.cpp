@@ -32,7 +32,8 @@ constexpr uint64_t kPlanOptions =
     (kConvertOptions & ~(kSkipExisting | kDryRun | kKeepGoing | kHtml | kManyOptions)) | kFilesFrom | kNull |
     kShards;
 
-constexpr uint64_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting;
+constexpr uint64_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting |
+                                    kView | kBackground | kUpright | kAxes | kAnimate;
 
 constexpr ShellCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
@@ -75,10 +76,11 @@ constexpr ShellCommand kCommands[] = {
         "Convert one shard of a plan; run it again to finish what is left.\n"
         "By default, the report is written next to the plan: plan.shard-3.jsonl.",
         "gaitwright run plan.jsonl --shard 3"),
-    Row("merge-report", "PLAN [REPORT...]", kOutput | kForce | kVerbose, 0, RunMergeReport,
+    Row("merge-report", "PLAN [REPORT...]", kOutput | kForce | kVerbose | kHtml, 0, RunMergeReport,
         "Merge the reports of all shards; print the summary and return the exit code of a single run.\n"
         "Lines are in the order of the plan. Without REPORT, the reports next to the plan are used. Without\n"
-        "-o, the lines go to standard output. A source without a line is unfinished: run its shard again.",
+        "-o, the lines go to standard output. A source without a line is unfinished: run its shard again.\n"
+        "--html writes the page of a single run; it shows details of sources that are on this machine.",
         "gaitwright merge-report plan.jsonl -o report.jsonl"),
     Row("info", "FILE", 0, 0, RunInfo,
         "Show what a motion or a container contains: format, frames, rate, bones, objects.",
@@ -135,10 +137,13 @@ constexpr ShellCommand kCommands[] = {
         "Pass --align for a result of 'convert --align'; it re-aligns the source the same way.\n"
         "--html PAGE writes the measurements, with curves over time and the worst frames, as a browser page.",
         "gaitwright compare walk.bvh walk.htr --profile \"Poser BVH\""),
-    Row("render", "FILE", kRenderOptions, kOutput, RunRender,
+    Row("render", "FILE", kRenderOptions, 0, RunRender,
         "Draw a motion as a PNG picture, with its result next to it or below it; needs no display.\n"
-        "A strip runs from the given frame to the end of the motion. A frame past the end is the last frame.",
-        "gaitwright render walk.bvh -o walk.png --with walk.Kinetra --strip 8 --size 1600x600"),
+        "A strip runs from the given frame to the end of the motion. A frame past the end is the last "
+        "frame.\n"
+        "The left side is green, the right side purple. --animate draws up to 30 pictures per second.",
+        "gaitwright render walk.bvh -o walk.png --with walk.Kinetra --strip 8 --size 1600x600",
+        kOutput | kAnimate),
 };
 
 size_t CountWords(std::string_view text)

@@ -49,6 +49,11 @@ enum EOption : uint64_t
     kDrafts = 1ull << 35,
     kMend = 1ull << 36,
     kVerbose = 1ull << 37,
+    kView = 1ull << 50,
+    kBackground = 1ull << 51,
+    kUpright = 1ull << 52,
+    kAxes = 1ull << 53,
+    kAnimate = 1ull << 54,
 };
 
 /// Options that control how a run works, but not what a source is converted to. All others are part of a

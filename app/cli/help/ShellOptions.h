@@ -49,8 +49,11 @@ struct ShellOptions
     std::string with;          ///< the motion to draw next to the first one; empty for none
     int64_t strip = 1;         ///< number of poses
     PixelSize size;
-    float rate = 0.0f;       ///< frames per second
-    float frameScale = 1.0f; ///< factor for the number of frames
+    std::string view = "front";       ///< direction of a picture: front, side, three-quarter or top
+    std::string background = "light"; ///< of a picture: light or dark
+    std::string animate;              ///< --animate, the animated picture to write; empty for none
+    float rate = 0.0f;                ///< frames per second
+    float frameScale = 1.0f;          ///< factor for the number of frames
 
     bool json = false;
     bool quiet = false;
@@ -68,6 +71,8 @@ struct ShellOptions
     bool draft = false;         ///< draft a profile if none fits; set by --drafts too
     bool mend = false;          ///< read sources repaired, if that is safe
     bool check = false;         ///< measure each result
+    bool upright = false;       ///< turn a motion whose up axis is not Y in a picture
+    bool axes = false;          ///< draw the axes of every bone
     bool objects = false;       ///< print all spatial objects, not only nodes
 };
 

@@ -6,6 +6,8 @@
 #include "CShellNotices.h"
 #include "Notice.h"
 #include "PageOutput.h"
+#include "PageOutputDetails.h"
+#include "PageOutputRow.h"
 
 #include <utility>
 
@@ -13,9 +15,10 @@ namespace gw {
 
 namespace {
 
-std::string OutcomeWords(EConversion outcome)
+// A large run draws the details of its worst conversions at its end.
+bool IsDrawnAtOnce(const ShellOptions& options, size_t jobCount)
 {
-    return outcome == EConversion::Converted ? "converted, but could not be measured" : OutcomeName(outcome);
+    return IsPageAsked(options) && jobCount <= CConversionPage::kDetailCount;
 }
 
 } // namespace
@@ -23,12 +26,13 @@ std::string OutcomeWords(EConversion outcome)
 CFileRun::FileEnd CConversionRun::Convert(const ShellOptions& options, size_t index, std::FILE* record)
 {
     CPagePart part(index + 1, AllJobs().size());
-    const EConversion outcome = ConvertFile(options, AllJobs()[index],
-                                            {.record = record,
-                                             .part = IsPageAsked(options) ? &part : nullptr,
-                                             .drafts = Drafts(),
-                                             .voice = Voice()});
-    m_kDrawn = part.ToText();
+    const EConversion outcome =
+        ConvertFile(options, AllJobs()[index],
+                    {.record = record,
+                     .part = IsDrawnAtOnce(options, AllJobs().size()) ? &part : nullptr,
+                     .drafts = Drafts(),
+                     .voice = Voice()});
+    m_kDrawn = part.Section();
     return {.outcome = outcome, .endsRun = outcome == EConversion::Failed && !options.keepGoing};
 }
 
@@ -64,24 +68,25 @@ std::string CConversionRun::Enclosure()
     return std::exchange(m_kDrawn, {});
 }
 
-void CConversionRun::TakeRecord(size_t index, EConversion outcome, std::string_view,
+void CConversionRun::TakeRecord(size_t index, EConversion outcome, std::string_view record,
                                 std::string_view enclosure)
 {
     m_uiTaken = index + 1;
     if (!IsPageAsked(Options()))
         return;
     CPagePart part(index + 1, AllJobs().size());
-    if (part.FromText(enclosure))
-        m_kPage.Add(AllJobs()[index].source, part);
-    else
-        m_kPage.AddWithoutFigures(AllJobs()[index].source, OutcomeWords(outcome));
+    m_kPage.Add(PageRowOf(AllJobs()[index].source, OutcomeName(outcome), record));
+    part.SetSection(enclosure);
+    m_kPage.AddDetails(part);
 }
 
 bool CConversionRun::FinishPage()
 {
     for (size_t left = m_uiTaken; left < AllJobs().size(); ++left)
-        m_kPage.AddWithoutFigures(AllJobs()[left].source, "left");
-    return !m_kPage.HasConversions() || WritePage(Options(), m_kPage);
+        m_kPage.Add({.source = AllJobs()[left].source, .outcome = "left"});
+    if (m_uiTaken == AllJobs().size()) // otherwise somebody wants the run to end
+        AddPageDetails(Options(), AllJobs(), Drafts(), m_kPage);
+    return !m_kPage.HasContent() || WritePage(Options(), m_kPage);
 }
 
 bool CConversionRun::TellEnd()

@@ -18,6 +18,7 @@
 #include "Paths.h"
 #include "PrivateNames.h"
 #include "RunRecord.h"
+#include "RunSetup.h"
 #include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
@@ -83,8 +84,7 @@ std::string CFileRun::DraftFolder() const
 {
     if (options_.dryRun)
         return {};
-    return options_.drafts.empty() && options_.resume ? m_kState.folder + ".gaitwright.drafts"
-                                                      : options_.drafts;
+    return options_.drafts.empty() && options_.resume ? ResumeDrafts(m_kState.folder) : options_.drafts;
 }
 
 bool CFileRun::OpenReport()
@@ -120,7 +120,9 @@ bool CFileRun::OpenState()
 {
     const CFilePlatform platform(EPlatformWriting::No, options_.dataFolder);
     CContentHash key;
-    key.AddText(GAITWRIGHT_VERSION).AddText(OptionsJson(options_, ~(kHowToRun | kProfile | kDrafts)));
+    constexpr uint64_t kHowToTell = kCheck | kHtml; // figures are stored in any case
+    key.AddText(GAITWRIGHT_VERSION)
+        .AddText(OptionsJson(options_, ~(kHowToRun | kHowToTell | kProfile | kDrafts)));
     for (const char* file : {"base.htr", "KsBone.bsm"})
         key.AddFile(platform.DataFolder() + file);
     if (!AddProfiles(key)) // by content, not by name

@@ -84,13 +84,22 @@ public:
         return EConversion::Converted;
     }
 
+    /// Converts without saving, and draws.
+    void Draw()
+    {
+        if (m_kConversion.Open(job_.source) && SelectProfile() && m_kConversion.HasFrames() && MayFit() &&
+            Convert())
+            Check();
+    }
+
 private:
     bool SelectProfile();
     bool Convert();
     // A later run with --resume may write a report, so measure for it.
     bool IsMeasured() const
     {
-        return options_.check || tools_.part || !options_.report.empty() || options_.resume;
+        return options_.check || tools_.part || !options_.html.empty() || !options_.report.empty() ||
+               options_.resume;
     }
     void Check();
     void CheckOtherOptions();
@@ -145,7 +154,7 @@ bool CJobSteps::Convert()
     return m_kConversion.HasFrames();
 }
 
-// Must run after saving, because measuring poses both trees.
+// Must not run before saving, because measuring poses both trees.
 void CJobSteps::Check()
 {
     ConvertedMotion motion = MotionOf(m_kConversion, job_);
@@ -207,6 +216,13 @@ EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, c
     account.outcome = Decide(options, job, notices, account, tools);
     TellAccount(options, job, account, notices, tools.record);
     return account.outcome;
+}
+
+void DrawConversion(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools)
+{
+    CShellNotices notices(options, tools.voice);
+    ConversionAccount account;
+    CJobSteps(options, job, notices, account, tools).Draw();
 }
 
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,

@@ -60,6 +60,10 @@ struct ConversionTools
 /// standard output and everything else to standard error. Keeps no state for the next source.
 EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools);
 
+/// Converts a source in memory and draws the part of a page about it. Writes no file and prints nothing; if
+/// the conversion fails, the part stays empty.
+void DrawConversion(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools);
+
 /// Reports, in the same format, a conversion that failed for a reason it could not report itself.
 void TellFailed(const ShellOptions& options, const ConversionJob& job, const Notice& reason,
                 const ConversionTools& tools);

@@ -56,6 +56,11 @@ bool MakeOutputFolder(const ShellOptions& options)
     return false;
 }
 
+std::string ResumeDrafts(const std::string& stateFolder)
+{
+    return WithSeparator(stateFolder) + ".gaitwright.drafts";
+}
+
 RunState StateOf(const ShellOptions& options)
 {
     RunState state;

@@ -12,5 +12,7 @@ bool AreOutputsApart(const CFileRun::Jobs& jobs);
 bool MakeOutputFolder(const ShellOptions& options);
 /// Returns the location of the --resume state: the output folder, otherwise the folder of the sources.
 RunState StateOf(const ShellOptions& options);
+/// Returns the folder in which a --resume run keeps its drafts, by the folder of its state.
+std::string ResumeDrafts(const std::string& stateFolder);
 
 } // namespace gw
