@@ -15,12 +15,12 @@ cd "$(dirname "$0")"
 
 # What a bare machine needs, by purpose; README.md says why each is there.
 packages_build=(g++ cmake ninja-build pkg-config ccache)
-packages_engine=(libcli11-dev nlohmann-json3-dev libxxhash-dev libmagick++-6.q16-dev)
+packages_engine=(libcli11-dev nlohmann-json3-dev libxxhash-dev libmagick++-6.q16-dev libassimp-dev libseccomp-dev)
 packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libfreetype-dev libfontconfig-dev libgl1-mesa-dri)
 packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libx11-dev libgl1-mesa-dri fonts-dejavu-core)
 packages_package=(dpkg-dev file lintian desktop-file-utils appstream shared-mime-info man-db)
 packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth xdotool dbus-daemon zsh fish)
-packages_bench=(libbenchmark-dev libassimp-dev python3 time)
+packages_bench=(libbenchmark-dev python3 time)
 packages_cluster=(slurm-wlm munge parallel)
 packages_lint=(clang-format clang-tidy)
 packages_fuzz=(clang libclang-rt-14-dev python3)

@@ -22,7 +22,7 @@ endforeach()
 
 # Pictures are drawn by a driver that is loaded by name.
 set(CPACK_DEBIAN_SHELL_PACKAGE_SECTION graphics)
-set(CPACK_DEBIAN_SHELL_PACKAGE_RECOMMENDS libgl1-mesa-dri)
+set(CPACK_DEBIAN_SHELL_PACKAGE_RECOMMENDS "libgl1-mesa-dri, gaitwright-import")
 set(CPACK_COMPONENT_SHELL_DESCRIPTION
     "motion capture converted to one fixed skeleton, in the shell
 Reads BVH, HTR, CHA and CHB motions and scene containers with keyframed
@@ -31,6 +31,14 @@ and writes Kinetra files. Whole archives convert in one run.
 .
 This package holds the command line program, which needs no display, the
 target skeleton and the bone maps of common conventions.")
+
+set(CPACK_DEBIAN_IMPORT_PACKAGE_SECTION graphics)
+set(CPACK_DEBIAN_IMPORT_PACKAGE_DEPENDS "gaitwright (= ${PROJECT_VERSION})")
+set(CPACK_COMPONENT_IMPORT_DESCRIPTION
+    "FBX, glTF and Collada motions for Gaitwright
+The program that Gaitwright starts to read the files of modeling programs: the
+skeleton with its rest pose and its clips. It runs in a process with little
+memory, time and no network, because such files come from anywhere.")
 
 # The window system plugin and the fonts are loaded by name too.
 set(CPACK_DEBIAN_DESKTOP_PACKAGE_SECTION graphics)

@@ -148,7 +148,8 @@ MotionFacts CheckPoses(const CMotionFile& motion, const BVHOutline* outline, CFi
     facts.frameSeconds = static_cast<double>(motion.GetFrequency());
     facts.body = SourceOf(found);
     facts.leg = RestLegLength(found.body);
-    facts.unit = UnitOfLeg(facts.leg);
+    const double unit = motion.imported.unitMeters;
+    facts.unit = unit > 0.0 ? UnitOfMeters(unit) : UnitOfLeg(facts.leg);
     if (found.body.DrivesBody())
         facts.restPose = RestStanceOf(found.body).Verdict();
     const BodyPaths paths = FollowBody(motion, found.body);

@@ -41,7 +41,7 @@ constexpr Sentence kSentences[] = {
     Row(Exists, "exists", "the file exists; --force replaces it"),
     Row(OutOfMemory, "out-of-memory", "there is not enough memory"),
     Row(UnknownFormat, "unknown-format", "this kind of file is not supported",
-        "use .bvh, .htr, .cha, .chb, .orn"),
+        "use .bvh, .htr, .cha, .chb, .orn, .fbx, .gltf, .glb, .vrm, .dae"),
     Row(BadHeader, "bad-header", "the beginning of the file does not match its extension", kCopyAgain),
     Row(BadVersion, "bad-version", "this version of the format is not supported"),
     Row(Empty, "empty", "the file contains nothing usable"),
@@ -79,6 +79,14 @@ constexpr Sentence kSentences[] = {
         "add an empty line after the header"),
     Row(SkippedPicture, "skipped-picture",
         "a linked picture was not read: together, the pictures are too large", "link smaller pictures"),
+    Row(NoImporter, "no-importer", "reading this format needs the program gaitwright-import",
+        "install the package gaitwright-import"),
+    Row(ImportStopped, "import-stopped", "the program that reads this format ended before it was done",
+        "the file may be damaged, or too large to be read"),
+    Row(NotImported, "not-imported", "the file cannot be read", kCopyAgain),
+    Row(NoSkeleton, "no-skeleton", "the file has no skeleton, so it contains no motion of a body",
+        "export it with its skeleton"),
+    Row(NoClip, "no-clip", "the file has no clip of this name", "list its clips with --list-clips"),
 
     // Found by examining a motion file.
     Row(LfsPointer, "lfs-pointer", "this is a Git LFS pointer, not the motion itself",

@@ -51,6 +51,13 @@ enum class EFailure : uint8_t
     /// a linked picture that was not decoded, because the scene's pictures take too much memory
     SkippedPicture,
 
+    // Files of modeling programs, which another program reads.
+    NoImporter,    ///< that program is not installed
+    ImportStopped, ///< it died or was killed
+    NotImported,   ///< it cannot read the file; `name` is the reason
+    NoSkeleton,    ///< no joints
+    NoClip,        ///< no clip of this name
+
     // Found by examining a motion file. Readers and writers do not use the reasons from here on.
     LfsPointer,
     NotText,

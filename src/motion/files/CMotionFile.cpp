@@ -13,12 +13,14 @@
 #include "TKCHAStream.h"
 #include "TKCHBStream.h"
 #include "TKHTRStream.h"
+#include "TKImportStream.h"
 
 #include <algorithm>
 #include <iterator>
 #include <memory>
 #include <new>
 #include <string_view>
+#include <utility>
 #include <vector>
 
 namespace gw {
@@ -45,8 +47,12 @@ constexpr StreamRow kStreams[] = {
     {".chb", Make<TKCHBStream>, false},
 };
 
+constexpr StreamRow kImport = {{}, Make<TKImportStream>, false};
+
 const StreamRow* FindStream(const std::string& path)
 {
+    if (IsImported(path))
+        return &kImport;
     const auto fits = [&](const StreamRow& row) { return HasExtension(path, row.extension); };
     const auto found = std::ranges::find_if(kStreams, fits);
     return found == std::end(kStreams) ? nullptr : found;
@@ -98,6 +104,7 @@ bool CMotionFile::Load(const std::string& path)
         const auto stream = row->make();
         stream->boneMeshes = boneMeshes;
         stream->lines.SetProgress(progress_);
+        stream->importChoice = importChoice;
         const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
         m_kRecord = stream->m_kRecord;
         if (!stream->IsSourceWhole())
@@ -110,6 +117,7 @@ bool CMotionFile::Load(const std::string& path)
         JudgeRestPose(*stream->motionRoot, m_kRecord);
         motionRoot = stream->motionRoot;
         fileVersion = stream->fileVersion;
+        imported = std::move(stream->imported);
         if (row->hasRestTree)
             restRoot = stream->restRoot;
     }

@@ -5,6 +5,7 @@
 #include "CNode.h"
 #include "CTextLines.h"
 #include "HTRPose.h"
+#include "ImportFacts.h"
 #include "MotionNode.h"
 
 #include <cstddef>
@@ -56,6 +57,8 @@ public:
     int fileVersion = 1;
     EQuarterTurns quarterTurns = EQuarterTurns::Flipped; ///< how Save writes them
     EBoneMeshes boneMeshes = EBoneMeshes::Drawn;         ///< how Load makes them
+    ImportChoice importChoice;                           ///< for files of modeling programs
+    ImportFacts imported;                                ///< filled by Load, for the same files
 
 protected:
     /// Maps a text file and rewinds. Returns false for an empty path or a file that cannot be read.

@@ -1,0 +1,200 @@
+// gaitwright-import [--clip=NAME] [--rate=RATE] FILE: reads a file of a modeling program and writes its
+// motion to the standard output, for the reader that started it. The file may be hostile and the library has
+// had faults, so the process gives up everything it does not need before it opens the file. It never fails by
+// itself: what went wrong is part of the message.
+
+#include "CSceneNodes.h"
+#include "ImportedMotion.h"
+#include "Sandbox.h"
+#include "ScenePoses.h"
+#include "SceneSkeleton.h"
+
+#include <assimp/Importer.hpp>
+#include <assimp/config.h>
+
+#include <algorithm>
+#include <cctype>
+#include <cstdio>
+#include <cstdlib>
+#include <new>
+#include <numbers>
+#include <string>
+#include <string_view>
+
+namespace gw {
+
+namespace {
+
+constexpr double kMostKeys = 1 << 27; // 28 bytes each, 3.5 GB
+
+struct Order
+{
+    std::string clip;
+    double rate = 0.0;
+    std::string path;
+};
+
+Order ReadArguments(int count, char** arguments)
+{
+    constexpr std::string_view kClip = "--clip=";
+    constexpr std::string_view kRate = "--rate=";
+    Order order;
+    for (int i = 1; i < count; ++i)
+    {
+        const std::string_view argument = arguments[i];
+        if (argument.starts_with(kClip))
+            order.clip = argument.substr(kClip.size());
+        else if (argument.starts_with(kRate))
+            order.rate = std::atof(arguments[i] + kRate.size());
+        else
+            order.path = argument;
+    }
+    return order;
+}
+
+bool EqualNoCase(std::string_view a, std::string_view b)
+{
+    const auto lower = [](unsigned char c) { return std::tolower(c); };
+    return std::ranges::equal(a, b, {}, lower, lower);
+}
+
+std::string ClipName(const aiAnimation& clip, unsigned index)
+{
+    return clip.mName.length > 0 ? clip.mName.C_Str() : "clip " + std::to_string(index + 1);
+}
+
+// Returns the requested clip, or the longest; null if there is none.
+const aiAnimation* ChooseClip(const aiScene& scene, const Order& order, ImportedMotion& motion)
+{
+    const aiAnimation* chosen = nullptr;
+    double longest = -1.0;
+    for (unsigned i = 0; i < scene.mNumAnimations; ++i)
+    {
+        const aiAnimation& clip = *scene.mAnimations[i];
+        motion.clips.push_back(ClipName(clip, i));
+        const double seconds = clip.mDuration / std::max(clip.mTicksPerSecond, 1.0);
+        const bool fits =
+            order.clip.empty() ? seconds > longest : !chosen && EqualNoCase(motion.clips.back(), order.clip);
+        if (!fits)
+            continue;
+        chosen = &clip;
+        longest = seconds;
+        motion.clip = motion.clips.back();
+    }
+    return chosen;
+}
+
+template <class T>
+T Fact(const aiScene& scene, const char* name, T fallback)
+{
+    T value = fallback;
+    return scene.mMetaData && scene.mMetaData->Get(name, value) ? value : fallback;
+}
+
+double UnitMeters(const aiScene& scene, std::string_view extension)
+{
+    constexpr double kCentimeter = 0.01;
+    if (scene.mMetaData && scene.mMetaData->HasKey("UnitScaleFactor"))
+        return kCentimeter * Fact(scene, "UnitScaleFactor", 1.0);
+    return extension == ".dae" ? 0.0 : 1.0; // glTF is in meters
+}
+
+// The rotation that turns the file's up axis to Y, if the library has not applied it to the root itself.
+SceneMatrix Upright(const aiScene& scene, bool& turns)
+{
+    constexpr double kQuarter = std::numbers::pi / 2;
+    const int axis = Fact(scene, "UpAxis", 1);
+    const int sign = Fact(scene, "UpAxisSign", 1);
+    SceneMatrix matrix;
+    turns = scene.mRootNode->mTransformation.IsIdentity() && (axis != 1 || sign < 0);
+    if (!turns)
+        return matrix;
+    if (axis == 2)
+        return SceneMatrix::RotationX(sign < 0 ? kQuarter : -kQuarter, matrix);
+    if (axis == 0)
+        return SceneMatrix::RotationZ(sign < 0 ? -kQuarter : kQuarter, matrix);
+    return SceneMatrix::RotationX(2.0 * kQuarter, matrix);
+}
+
+std::string ExtensionOf(const std::string& path)
+{
+    const size_t dot = path.rfind('.');
+    std::string extension = dot == path.npos ? std::string() : path.substr(dot);
+    std::ranges::transform(extension, extension.begin(), [](unsigned char c) { return std::tolower(c); });
+    return extension;
+}
+
+void Refuse(ImportedMotion& motion, EImport outcome, std::string words = {})
+{
+    motion.outcome = outcome;
+    motion.words = std::move(words);
+}
+
+void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
+{
+    const CSceneNodes nodes(scene);
+    const SceneSkeleton skeleton = FindSkeleton(nodes);
+    const aiAnimation* const animation = ChooseClip(scene, order, motion);
+    if (!order.clip.empty() && !animation)
+        return Refuse(motion, EImport::NoClip, order.clip);
+    if (skeleton.nodes.empty())
+        return Refuse(motion, EImport::NoSkeleton);
+    const SceneClip clip = PlanClip(nodes, animation, order.rate);
+    if (!(clip.frames * static_cast<double>(skeleton.nodes.size()) < kMostKeys))
+        return Refuse(motion, EImport::TooLarge);
+    motion.rate = clip.rate;
+    motion.isRateOfFile = clip.isRateOfFile;
+    motion.unitMeters = UnitMeters(scene, ExtensionOf(order.path));
+    motion.frameCount = static_cast<uint32_t>(clip.frames);
+    const SceneMatrix upright = Upright(scene, motion.wasTurnedUp);
+    SampleJoints(nodes, skeleton, clip, upright, motion);
+}
+
+ImportedMotion Import(const Order& order)
+{
+    ImportedMotion motion;
+    Assimp::Importer importer;
+    importer.SetPropertyBool(AI_CONFIG_IMPORT_REMOVE_EMPTY_BONES, false);
+    importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_TEXTURES, false);
+    importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_MATERIALS, false);
+    const aiScene* const scene = importer.ReadFile(order.path, 0);
+    if (scene && scene->mRootNode)
+        ReadScene(*scene, order, motion);
+    else
+        Refuse(motion, EImport::Refused, importer.GetErrorString());
+    return motion;
+}
+
+ImportedMotion ImportSafely(const Order& order)
+{
+    try
+    {
+        return Import(order);
+    } catch (const std::bad_alloc&)
+    {
+        ImportedMotion motion;
+        Refuse(motion, EImport::TooLarge);
+        return motion;
+    } catch (const std::exception& failure)
+    {
+        ImportedMotion motion;
+        Refuse(motion, EImport::Refused, failure.what());
+        return motion;
+    }
+}
+
+} // namespace
+
+} // namespace gw
+
+int main(int count, char** arguments)
+{
+    const gw::Order order = gw::ReadArguments(count, arguments);
+    if (order.path.empty() || !gw::EnterSandbox())
+        return EXIT_FAILURE;
+    const auto write = [](std::span<const std::byte> bytes) {
+        return std::fwrite(bytes.data(), 1, bytes.size(), stdout) == bytes.size();
+    };
+    const bool sent = gw::WriteImported(gw::ImportSafely(order), write) && std::fflush(stdout) == 0;
+    return sent ? EXIT_SUCCESS : EXIT_FAILURE;
+}

@@ -1,0 +1,31 @@
+#pragma once
+
+#include <cstddef>
+#include <cstdint>
+#include <string>
+#include <vector>
+
+namespace gw {
+
+/// What a program may take before it is killed.
+struct ChildLimits
+{
+    double seconds = 0.0;
+    size_t outputBytes = 0;
+};
+
+enum class EChildEnd : uint8_t
+{
+    Finished, ///< it exited by itself, with any exit code
+    Missing,  ///< it could not be started
+    Died,     ///< a signal ended it
+    TimedOut,
+    TooMuch, ///< it wrote more than allowed
+};
+
+/// Runs a program and collects what it writes to its standard output. Its standard input is empty, and what
+/// it writes to its standard error is discarded. The program gets none of this one's open files.
+EChildEnd RunChild(const std::string& program, const std::vector<std::string>& arguments,
+                   const ChildLimits& limits, std::vector<std::byte>& output);
+
+} // namespace gw
