@@ -61,8 +61,13 @@ void Write(const std::string& text)
 
 size_t TerminalWidth()
 {
+    return TerminalWidth(STDERR_FILENO);
+}
+
+size_t TerminalWidth(int stream)
+{
     winsize size = {};
-    return ioctl(STDERR_FILENO, TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : kUsualWidth;
+    return ioctl(stream, TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : kUsualWidth;
 }
 
 std::string ProgressLine(const RunProgress& progress, size_t width)

@@ -21,6 +21,8 @@ std::string ProgressLine(const RunProgress& progress, size_t width);
 
 /// Returns the width in characters of the terminal of standard error; 80 if it is unknown.
 size_t TerminalWidth();
+/// Same for the terminal behind another stream.
+size_t TerminalWidth(int stream);
 
 /// A progress line on the terminal of standard error. Without a terminal, nothing is shown.
 class CProgressBar

@@ -47,6 +47,7 @@ bool TakeEntry(const CJsonMembers& json, CRunPlan& plan)
         !json.TakeCount("bytes", entry.byteCount))
         return false;
     entry.shard = shard;
+    json.TakeText("clip", entry.clip);
     plan.entries.push_back(std::move(entry));
     return true;
 }
@@ -93,13 +94,13 @@ bool WritePlan(const std::string& path, const CRunPlan& plan)
                                                   .Text() +
                                               '\n');
     for (const CRunPlan::Entry& entry : plan.entries)
-        good = good && file.Write(CJsonLine()
-                                      .Add("shard", entry.shard)
-                                      .Add("source", entry.source)
-                                      .Add("output", entry.output)
-                                      .Add("bytes", entry.byteCount)
-                                      .Text() +
-                                  '\n');
+    {
+        CJsonLine line;
+        line.Add("shard", entry.shard).Add("source", entry.source).Add("output", entry.output);
+        if (!entry.clip.empty())
+            line.Add("clip", entry.clip);
+        good = good && file.Write(line.Add("bytes", entry.byteCount).Text() + '\n');
+    }
     return good && file.Commit();
 }
 

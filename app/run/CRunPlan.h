@@ -19,6 +19,7 @@ struct CRunPlan
         std::string output;
         uint64_t byteCount = 0;
         size_t shard = 0;
+        std::string clip = {}; ///< of a source with several; empty for the longest
     };
 
     std::string version;      ///< of the program that wrote it

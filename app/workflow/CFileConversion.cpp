@@ -8,6 +8,7 @@
 #include "CResourceManager.h"
 #include "FindBone.h"
 #include "FindingWords.h"
+#include "GlbFile.h"
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "ResultFile.h"
@@ -46,9 +47,9 @@ bool CFileConversion::LoadSource(const std::string& path, const std::string& cop
 {
     sourcePath_ = path;
     sourceNames_.reset();
-    isScene_ = HasExtension(path, kSceneExtension);
-    const bool loaded =
-        isScene_ ? LoadSourceScene(path, scene_, sourceRecord_) : motion_.Load(copy.empty() ? path : copy);
+    const std::string& file = copy.empty() ? path : copy;
+    isScene_ = HasExtension(file, kSceneExtension);
+    const bool loaded = isScene_ ? LoadSourceScene(file, scene_, sourceRecord_) : motion_.Load(file);
     if (!isScene_)
         sourceRecord_ = motion_.Record();
     else if (loaded)
@@ -57,7 +58,15 @@ bool CFileConversion::LoadSource(const std::string& path, const std::string& cop
     Notify(path, sourceRecord_);
     if (!loaded)
         TellMessage(kInvalidSourceMessage);
+    else if (rate_ > 0.0f)
+        SetFrameTime(*SourceRoot(), 1.0f / rate_);
     return loaded;
+}
+
+void CFileConversion::SelectSource(const std::string& clip, float rate)
+{
+    motion_.importChoice = {clip, rate};
+    rate_ = rate;
 }
 
 CNode* CFileConversion::SourceRoot() const
@@ -177,12 +186,32 @@ bool CFileConversion::Convert(bool useLegs)
 bool CFileConversion::WriteResult(const std::string& path, bool* taken)
 {
     CFailureRecord record;
-    const bool written = WriteResultFile(result_, path, profile_.frameRate, record);
+    WriteResultFile(result_, path, profile_.frameRate, record);
+    return TellWritten(path, record, taken);
+}
+
+bool CFileConversion::WriteExchange(const std::string& path, bool* taken)
+{
+    constexpr double kMetersPerUnit = 0.001; // of the host skeleton
+    if (HasExtension(path, ".glb"))
+    {
+        CFailureRecord record;
+        SaveGlb(result_, kMetersPerUnit, path, record);
+        return TellWritten(path, record, taken);
+    }
+    TKBVHStream stream(result_);
+    stream.WriteExact(path);
+    return TellWritten(path, stream.Record(), taken);
+}
+
+// Reports the end of writing.
+bool CFileConversion::TellWritten(const std::string& path, const CFailureRecord& record, bool* taken) const
+{
     if (taken && record.Failure().reason == EFailure::Exists)
         *taken = true;
     else
         Notify(path, record);
-    return written;
+    return !record.Failure();
 }
 
 bool CFileConversion::WriteBatchResult(const std::string& path)

@@ -5,6 +5,7 @@
 #include "CMotionFile.h"
 #include "COrrinStream.h"
 #include "CRetargeter.h"
+#include "EditMotion.h"
 #include "FindBone.h"
 #include "ProfileRows.h"
 
@@ -27,6 +28,9 @@ public:
 
     /// Reads a source. `copy`, unless empty, is the file to read in its place.
     bool LoadSource(const std::string& path, const std::string& copy = {});
+    /// Selects what LoadSource reads: the clip of a file with several, and the rate, in frames per second, in
+    /// place of the file's own; 0 for that.
+    void SelectSource(const std::string& clip, float rate);
     /// Reads the base skeleton. Each conversion needs a new one.
     bool LoadTarget();
     bool UseProfile(const std::string& path);
@@ -42,6 +46,9 @@ public:
     /// WriteBatchResult an HTR with as many frames as a batch run. A file that must not be replaced, and
     /// exists by now, is a failure, or sets `taken` instead if that is given.
     bool WriteResult(const std::string& path, bool* taken = nullptr);
+    /// Writes the result, with all frames at the source's rate, as .bvh or .glb, by the extension. `taken` as
+    /// for WriteResult.
+    bool WriteExchange(const std::string& path, bool* taken = nullptr);
     bool WriteBatchResult(const std::string& path);
     /// Writes the source as a BVH file, re-expressed relative to a T-pose. Call it instead of Convert, with
     /// the option `align`.
@@ -77,6 +84,7 @@ protected:
 
 private:
     bool Prepare(EAlignedJoints joints);
+    bool TellWritten(const std::string& path, const CFailureRecord& record, bool* taken) const;
     void WarnOfNumbers() const;
     void TellMessage(int id) const;
 
@@ -84,6 +92,7 @@ private:
     ConversionChoices choices_;
     NoticeListener notify_;
     std::string sourcePath_;
+    float rate_ = 0.0f;
     bool isScene_ = false; // the source is the scene below, not the motion
     COrrinStream scene_;
     CMotionFile motion_;

@@ -7,15 +7,11 @@
 
 namespace gw {
 
-namespace {
-
 bool IsBinary(const std::string& path)
 {
     constexpr std::string_view kExtensions[] = {".orn", ".kinetra", ".chb"};
     return std::ranges::any_of(kExtensions, [&](std::string_view e) { return HasExtension(path, e); });
 }
-
-} // namespace
 
 Notice MakeNotice(const std::string& path, const char* code, const std::string& words, ESeverity severity)
 {

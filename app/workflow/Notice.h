@@ -21,6 +21,9 @@ struct Notice
     bool IsWarning() const { return severity != ESeverity::Error; }
 };
 
+/// Returns whether places in a file are bytes instead of lines.
+bool IsBinary(const std::string& path);
+
 /// Returns a notice about a whole file.
 Notice MakeNotice(const std::string& path, const char* code, const std::string& words,
                   ESeverity severity = ESeverity::Error);

@@ -13,7 +13,7 @@ OLD = b"an older result"
 REFUSED = [  # what, arguments behind "convert", words on standard error
     ("an output that exists", "walk.bvh -o old.Kinetra", ["old.Kinetra", "--force"]),
     ("the default output exists", "old.bvh", ["old.Kinetra", "--force"]),
-    ("a folder as output, even by force", "walk.bvh -o folder.Kinetra --force", ["folder.Kinetra", "folder"]),
+    ("a folder instead of the result, even by force", "walk.bvh -o folder --force", ["folder/walk.Kinetra", "folder"]),
     ("no such source", "none.bvh -o a.Kinetra", ["none.bvh", "cannot be opened"]),
     ("a source of an unknown kind", "made.prf -o a.Kinetra", ["made.prf", ".bvh"]),
     ("no folder for the output", "walk.bvh -o none/a.Kinetra", ["none/a.Kinetra", "cannot be written"]),
@@ -36,7 +36,7 @@ class Convert(CliTest):
             self.write(name, walk)
         for name in ("old.Kinetra", "old.htr"):
             self.write(name, OLD)
-        (self.folder / "folder.Kinetra").mkdir()
+        (self.folder / "folder/walk.Kinetra").mkdir(parents=True)
         self.write("made.prf", profile("Made", [("hipp", "LowerTorso"), ("Xyzzy", "Waist"), ("neck", "Neck")]))
         self.write("small.prf", profile("Small", [("Hips", "LowerTorso"), ("Chest", "UpperTorso")]))
         self.write("small.bvh", BVH)
@@ -77,7 +77,7 @@ class Convert(CliTest):
     def test_a_dry_run_tells_profile_and_name_and_writes_nothing(self):
         result = self.succeed("convert", "walk.bvh", "--dry-run", "--json")
         plan = json.loads(result.out)
-        self.assertEqual((plan["outcome"], plan["output"], plan["profile"]), ("planned", "walk.Kinetra", "Poser BVH"))
+        self.assertEqual((plan["outcome"], plan["output"], plan["profile"]), ("would_convert", "walk.Kinetra", "Poser BVH"))
         self.assertEqual(self.with_assets("convert", "none.bvh", "--dry-run").code, FAILED)
         self.assertEqual(self.made(), [])
 

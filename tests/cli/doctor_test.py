@@ -35,11 +35,7 @@ class Doctor(CliTest):
         self.write("ill.bvh", ILL)
         self.write("a.bvh", BVH)
         result = self.run_program("doctor", "ill.bvh", "a.bvh", "--json")
-        decoder, text, files = json.JSONDecoder(), result.out.strip(), []
-        while text:
-            value, end = decoder.raw_decode(text)
-            files.append(value)
-            text = text[end:].strip()
+        files = [json.loads(line) for line in result.out.splitlines()][:-1]
         self.assertEqual([f["healthy"] for f in files], [False, True])
         self.assertIsNone(files[0]["facts"])
         self.assertEqual(files[1]["facts"]["frames"], 3)

@@ -19,7 +19,8 @@ SECONDS = 60  # for a run that takes a tenth of one, on a busy machine under a s
 class Result:
     def __init__(self, done):
         self.code = done.returncode
-        self.out = done.stdout.decode("utf-8")  # whatever the names in a file: output is UTF-8
+        self.bytes = done.stdout
+        self.out = done.stdout.decode("utf-8", "replace")  # whatever the names in a file: output is UTF-8
         self.err = done.stderr.decode("utf-8")
 
 
@@ -34,10 +35,10 @@ class CliTest(unittest.TestCase):
             if name.endswith("SAN_OPTIONS"):
                 self.environment[name] = value
 
-    def run_program(self, *arguments, program=PROGRAM, stdout=subprocess.PIPE):
-        """Runs in the test's folder."""
+    def run_program(self, *arguments, program=PROGRAM, stdout=subprocess.PIPE, given=b""):
+        """Runs in the test's folder, with bytes on standard input."""
         done = subprocess.run([program, *map(str, arguments)], cwd=self.folder, env=self.environment,
-                              stdin=subprocess.DEVNULL, stdout=stdout, stderr=subprocess.PIPE, timeout=SECONDS)
+                              input=given, stdout=stdout, stderr=subprocess.PIPE, timeout=SECONDS)
         if done.stdout is None:
             done.stdout = b""
         self.assertIn(done.returncode, (DONE, FAILED, USAGE), done.stderr[-2000:])

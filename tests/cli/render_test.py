@@ -30,13 +30,12 @@ class Pictures(CliTest):
 
     def test_frames_look_different_and_those_behind_the_end_like_the_end(self):
         rows = [(frame, self.render(WALK, *SIZE, "--frame=%d" % frame).rows, self.facts["frame"])
-                for frame in (-7, 0, 20, 66, 67, 10**15)]
+                for frame in (0, 20, 66, 67, 10**15)]
         pixels = [row[1] for row in rows]
-        self.assertEqual([row[2] for row in rows], [0, 0, 20, 66, 66, 66])
-        self.assertEqual(pixels[0], pixels[1])
-        self.assertEqual(pixels[3], pixels[4])
-        self.assertEqual(pixels[3], pixels[5])
-        self.assertTrue(pixels[1] != pixels[2] != pixels[3])
+        self.assertEqual([row[2] for row in rows], [0, 20, 66, 66, 66])
+        self.assertEqual(pixels[2], pixels[3])
+        self.assertEqual(pixels[2], pixels[4])
+        self.assertTrue(pixels[0] != pixels[1] != pixels[2])
 
     def test_a_result_stands_beside_its_source_whatever_file_it_lies_in(self):
         alone = self.render(WALK, *SIZE)

@@ -108,7 +108,7 @@ class Same(RunTest):
         self.write("takes/a/t12.bvh", BROKEN)
         result = self.with_assets("batch", "takes", "--job", "htr", "--json", "--out-dir", "out", "--keep-going",
                                   "--report", "report.jsonl")
-        self.assertEqual((result.code, lines(result.out)[0]["finished"]), (FAILED, TAKES - 1))
+        self.assertEqual((result.code, lines(result.out)[-1]["finished"]), (FAILED, TAKES - 1))
         self.assertEqual(len([f for f in self.files() if f.startswith("out/") and f.endswith(".htr")]), TAKES - 1)
         self.assertEqual([line["source"] for line in self.report() if line["outcome"] == "failed"],
                          ["takes/a/t12.bvh"])

@@ -17,11 +17,16 @@ WRONG = [  # what, arguments, words on standard error
     ("one operand of two", "resave a.orn", ["needs IN OUT"]),
     ("an operand too many", "info a.bvh b.bvh", ["b.bvh"]),
     ("a required option is missing", "extract a.Kinetra", ["-o"]),
-    ("none of two options of which one must be there", "pose a.bvh", ["--frame N | --time T"]),
+    ("none of two options of which one must be there", "pose a.bvh", ["--frame N | --all | --time T"]),
     ("a time without end", "pose a.bvh --time inf", ["inf"]),
     ("an option without its value", "pose a.bvh --frame", ["--frame"]),
     ("an option twice", "pose a.bvh --frame 1 --frame 2", ["--frame"]),
     ("a frame that is not an integer", "pose a.bvh --frame 1.5", ["1.5"]),
+    ("a rate without a frame time", "convert a.bvh --rate 1e-40", ["--rate"]),
+    ("a frame before the first", "pose a.bvh --frame -1", ['--frame: "-1"']),
+    ("a count below nothing", "convert a.bvh --jobs -1", ['--jobs: "-1" is not a count']),
+    ("a range that ends before it begins", "convert a.bvh --frames 5-2", ["--frames", '"5-2"']),
+    ("a format and another name", "convert a.bvh -o a.htr --format bvh", ["--format bvh", "a.htr"]),
     ("a frame that no integer holds", "pose a.bvh --frame 99999999999999999999", ["--frame"]),
     ("a rate of nothing", "package a.htr b.Kinetra --rate 0", ['"0"', "not a positive number"]),
     ("a rate that is not a number", "package a.htr b.Kinetra --rate nan", ["nan"]),
@@ -52,7 +57,8 @@ class Usage(CliTest):
         listed = self.run_program("--help").out
         for command in COMMANDS:
             with self.subTest(command):
-                result = self.run_program(command, "--help")
+                result = self.run_program("help", command)
+                self.assertEqual(self.run_program(command, "--help").out, result.out)
                 self.assertEqual((result.code, result.err), (DONE, ""))
                 self.assertIn("\n  " + command + " ", listed)
                 self.assertIn("Usage: gaitwright " + command, result.out)

@@ -5,6 +5,7 @@ import re
 import shutil
 import signal
 import subprocess
+import sysconfig
 import tempfile
 import time
 import unittest
@@ -17,6 +18,8 @@ PLUGINS = "qt6/plugins/platforms/libqoffscreen.so"  # of a package that gaitforg
 SECONDS = 60
 SEARCH = {"PATH": os.environ.get("PATH", "") + ":/usr/sbin:/sbin"}
 
+# Programs that only other programs start.
+PROGRAMS = "usr/lib/{}/gaitwright/".format(sysconfig.get_config_var("MULTIARCH"))
 # What a user has of each package, beside its manual, its licence and its list of changes.
 CONTENT = {
     "gaitwright": ["usr/bin/gaitwright", "usr/share/gaitwright/base.htr", "usr/share/gaitwright/KsBone.bsm",
@@ -28,6 +31,7 @@ CONTENT = {
                   "usr/share/applications/gaitforge.desktop", "usr/share/mime/packages/gaitforge.xml",
                   "usr/share/icons/hicolor/scalable/apps/gaitforge.svg",
                   "usr/share/metainfo/org.example.GaitForge.metainfo.xml"],
+    "gaitwright-import": [PROGRAMS + "gaitwright-import"],
     "libgaitwright-dev": ["usr/include/gaitwright/app/ConvertMotionFile.h"],
 }
 

@@ -7,6 +7,7 @@
 #include "CShellNotices.h"
 #include "CheckResult.h"
 #include "CommandTable.h"
+#include "JsonStatus.h"
 #include "NoticeJson.h"
 #include "Output.h"
 #include "Paths.h"
@@ -32,10 +33,15 @@ bool SelectProfile(const ShellOptions& options, CShellConversion& conversion, co
     return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
 }
 
-void WriteJson(const ShellOptions& options, const std::vector<Notice>& notices, size_t finished)
+void WriteJson(const ShellOptions& options, const std::vector<Notice>& notices, size_t finished, bool failed)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
+    json.Key("summary").Bool(true);
+    if (failed && std::ranges::all_of(notices, &Notice::IsWarning))
+        WriteFailed(json, FirstError());
+    else
+        WriteStatus(json, "ok", notices);
     json.Key("folder").Text(options.files.empty() ? std::string() : options.files[0]);
     json.Key("job").Text(options.job);
     json.Key("finished").Integer(static_cast<int64_t>(finished));
@@ -67,7 +73,7 @@ EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
     notices.insert(notices.end(), run.Notices().begin(), run.Notices().end());
     const bool failed = exit == EExit::Failed || !std::ranges::all_of(notices, &Notice::IsWarning);
     if (options.json)
-        WriteJson(options, notices, FinishedCount(options, run, failed));
+        WriteJson(options, notices, FinishedCount(options, run, failed), exit != EExit::Done || failed);
     return exit == EExit::Done && failed ? EExit::Failed : exit;
 }
 

@@ -23,18 +23,6 @@ namespace gw {
 
 namespace {
 
-// Loads the result of a conversion, unpacked if it is in a package.
-bool LoadResult(const ShellOptions& options, const std::string& path, CMotionFile& motion)
-{
-    if (HasExtension(path, ".Kinetra"))
-        return LoadPackagedMotion(path, motion);
-    const bool loaded = motion.Load(path);
-    if (!loaded)
-        SayFailure(path, motion.Record().Failure());
-    SayWarnings(options, path, motion.Record());
-    return loaded;
-}
-
 // The source as stored in its file, or as a conversion with --align reads it.
 class CComparedSource
 {
@@ -68,6 +56,7 @@ bool CComparedSource::LoadFile()
 {
     if (!m_kFile.LoadWhole(options_.files[0]))
         return false;
+    m_kFile.ShowInside(options_, options_.files[0]);
     SayWarnings(options_, options_.files[0], m_kFile.Record());
     return true;
 }
@@ -77,7 +66,7 @@ MotionClip CComparedSource::Clip()
 {
     if (options_.align)
         return SourceClipOf(m_kConversion);
-    if (!m_kFile.IsContainer())
+    if (!m_kFile.IsScene())
         return ClipOf(m_kFile.Motion());
     const std::vector<FoundNode> nodes = m_kFile.Nodes();
     const CKeyframeControl* track = m_kFile.FirstTrack();
@@ -91,7 +80,7 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
     std::vector<MissingBone> missing;
     if (!ReadBonePairs(profilePath, source, result, pairs, missing))
     {
-        SayError(Printable(profilePath) + ": the profile cannot be read" + TakeSystemErrorWords());
+        SayError(profilePath, "bad-profile", "the profile cannot be read" + TakeSystemErrorWords());
         return false;
     }
     for (const MissingBone& bone : missing)
@@ -130,7 +119,7 @@ EExit RunCompare(const ShellOptions& options)
     CComparedSource source(options);
     CMotionFile result;
     const std::string profilePath = source.FindProfile();
-    if (profilePath.empty() || !source.Load() || !LoadResult(options, options.files[1], result))
+    if (profilePath.empty() || !source.Load() || !LoadMotion(options, options.files[1], 0.0f, result))
         return EExit::Failed;
     const MotionClip sourceClip = source.Clip();
     const MotionClip resultClip = ClipOf(result);
@@ -142,7 +131,7 @@ EExit RunCompare(const ShellOptions& options)
     measured.sums = MeasureConversion(sourceClip, resultClip, pairs, detail);
     if (measured.sums.frameCount == 0)
     {
-        SayError("nothing to compare: one of the motions has no frames");
+        SayError({}, "nothing-to-compare", "nothing to compare: one of the motions has no frames");
         return EExit::Failed;
     }
     if (options.json)

@@ -1,6 +1,8 @@
 #include "CCustomData.h"
 #include "COrrinStream.h"
+#include "COutputFile.h"
 #include "CSafeFile.h"
+#include "CSourceFile.h"
 #include "CommandTable.h"
 #include "Output.h"
 #include "PackageBlocks.h"
@@ -23,6 +25,15 @@ EExit Fail(const std::string& path, Finding failure)
     return EExit::Failed;
 }
 
+// Reads a container, which may be a stream. Returns false, after printing the reason, unless it is complete.
+bool LoadContainer(COrrinStream& scene, const std::string& path)
+{
+    CSourceFile source;
+    if (!OpenSource(source, path, EPackage::Kept))
+        return false;
+    return LoadWhole(scene, source.Path(), path);
+}
+
 bool WriteWhole(const std::string& path, std::span<const std::byte> bytes)
 {
     CSafeFile file;
@@ -36,50 +47,55 @@ EExit RunResave(const ShellOptions& options)
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];
     COrrinStream scene;
-    if (!MayWrite(options, output) || !LoadWhole(scene, source))
+    COutputFile file;
+    if (!file.Open(options, output, ".orn") || !LoadContainer(scene, source))
         return EExit::Failed;
     SayWarnings(options, source, scene.Record());
-    if (!scene.SaveFile(output))
+    if (!scene.SaveFile(file.Path()))
         return Fail(output, scene.Record().Failure());
-    return TellWritten(options, source, output);
+    return file.DeliverOrSay() ? TellWritten(options, source, output) : EExit::Failed;
 }
 
 EExit RunExtract(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     COrrinStream scene;
-    if (!MayWrite(options, options.output) || !LoadWhole(scene, source))
+    COutputFile file;
+    if (!file.Open(options, options.output, ".htr") || !LoadContainer(scene, source))
         return EExit::Failed;
     const PackageBlocks blocks = FindPackage(scene);
     if (!blocks.file)
     {
-        SayError(Printable(source) + ": this is not a Kinetra file: its roots must include the data blocks "
-                                     "\"MotionInfo\" and \"MotionFile\"");
+        SayError(source, "not-a-package",
+                 "this is not a Kinetra file: its roots must include the data blocks "
+                 "\"MotionInfo\" and \"MotionFile\"");
         return EExit::Failed;
     }
     PackageFacts facts;
     const std::string inside = ReadPackageFacts(*blocks.info, facts) ? FormatExtension(facts.format) : "";
-    if (!inside.empty() && !HasExtension(options.output, inside))
-        SayWord(options, "warning: " + Printable(source) + " contains an " + inside + " file");
-    if (!WriteWhole(options.output, blocks.file->Data()))
+    if (!inside.empty() && !HasExtension(file.Path(), inside))
+        SayWarning(options, Printable(source) + " contains an " + inside + " file");
+    if (!WriteWhole(file.Path(), blocks.file->Data()))
     {
         SayNotWritten(options.output);
         return EExit::Failed;
     }
-    return TellWritten(options, source, options.output);
+    return file.DeliverOrSay() ? TellWritten(options, source, options.output) : EExit::Failed;
 }
 
 EExit RunPackage(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string& output = options.files[1];
-    if (!MayWrite(options, output))
+    COutputFile file;
+    CSourceFile motion;
+    if (!file.Open(options, output, ".Kinetra") || !OpenSource(motion, source, EPackage::Kept))
         return EExit::Failed;
     CFailureRecord record;
-    PackageMotion(source, output, options.rate, kPackageSixty, record);
+    PackageMotion(motion.Path(), file.Path(), options.rate, kPackageSixty, record);
     if (const Finding& failure = record.Failure())
         return Fail(failure.name.empty() ? output : failure.name, failure);
-    return TellWritten(options, source, output);
+    return file.DeliverOrSay() ? TellWritten(options, source, output) : EExit::Failed;
 }
 
 } // namespace gw

@@ -10,6 +10,7 @@
 #include "PageOutput.h"
 #include "Paths.h"
 #include "RunSetup.h"
+#include "Streams.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -19,18 +20,39 @@ namespace gw {
 
 namespace {
 
-// Determines the file to write: a name without an extension gets the save dialog's, and .htr is written in
-// lowercase.
-bool ResolveOutput(std::string& output)
+constexpr std::string_view kLowercase[] = {".htr", ".bvh", ".glb"};
+
+// Determines the file to write: a name without an extension gets that of the format, and other extensions
+// than .Kinetra are written in lowercase.
+bool ResolveOutput(const ShellOptions& options, std::string& output)
 {
+    const std::string_view wanted = ResultExtension(options);
+    if (IsStream(output))
+        return true;
+    if (SplitPath(output).extension.empty())
+        output += wanted;
     const PathParts parts = SplitPath(output);
-    if (parts.extension.empty())
-        output += ".Kinetra";
-    else if (EqualNoCase(parts.extension, ".htr"))
-        output = parts.folder + parts.stem + ".htr";
-    else if (!EqualNoCase(parts.extension, ".Kinetra"))
-        return Refuse(Printable(output) + ": the output must be a .Kinetra or .htr file");
-    return true;
+    if (!options.format.empty() && !HasExtension(output, wanted))
+        return Refuse("--format " + options.format + " does not fit the output " + Quoted(output));
+    for (const std::string_view extension : kLowercase)
+    {
+        if (!EqualNoCase(parts.extension, extension))
+            continue;
+        output = parts.folder + parts.stem + std::string(extension);
+        return true;
+    }
+    return HasExtension(output, ".Kinetra") ||
+           Refuse(Printable(output) + ": the output must be a .Kinetra, .htr, .bvh or .glb file");
+}
+
+// Without -o, the result goes next to the source, and that of standard input to standard output.
+std::string UsualOutput(const ShellOptions& options)
+{
+    const std::string& source = options.files[0];
+    const std::string name = StemOf(source) + std::string(ResultExtension(options));
+    if (!options.output.empty())
+        return FolderExists(options.output) ? WithSeparator(options.output) + name : options.output;
+    return source == kStandardStream ? source : SplitPath(source).folder + name;
 }
 
 bool PlanOne(const ShellOptions& options, CFileRun::Jobs& jobs)
@@ -38,11 +60,13 @@ bool PlanOne(const ShellOptions& options, CFileRun::Jobs& jobs)
     if (options.resume)
         return Refuse("--resume is for many files; it needs --out-dir DIR");
     const std::string& source = options.files[0];
-    std::string output = options.output;
-    if (output.empty())
-        output = SplitPath(source).folder + SplitPath(source).stem + ".Kinetra";
-    if (!ResolveOutput(output))
+    std::string output = UsualOutput(options);
+    if (options.output.empty() && IsStream(source) && !IsStream(output))
+        return Refuse("the source is a pipe or device; -o OUT names the result");
+    if (!ResolveOutput(options, output))
         return false;
+    if (options.json && IsStandardOutput(output))
+        return Refuse("--json and the result would both go to standard output");
     jobs.push_back({source, output});
     return true;
 }

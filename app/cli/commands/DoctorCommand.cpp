@@ -3,14 +3,21 @@
 
 #include "CFileExam.h"
 #include "CJsonWriter.h"
+#include "COutputFile.h"
 #include "CSceneFile.h"
+#include "CSourceFile.h"
+#include "Color.h"
 #include "CommandTable.h"
 #include "FindingWords.h"
+#include "JsonStatus.h"
+#include "Notice.h"
 #include "Output.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "Text.h"
 #include "Words.h"
 
+#include <algorithm>
 #include <cstdio>
 
 namespace gw {
@@ -26,17 +33,32 @@ void ExamineOther(const std::string& path, CFileExam& exam)
         exam.ExaminePoses(file.Motion());
 }
 
-void Examine(const std::string& path, CFileExam& exam)
+// Returns false, after printing the reason, if there is nothing to examine.
+bool Examine(const std::string& path, CFileExam& exam)
 {
-    if (HasExtension(path, ".bvh"))
-        exam.ExamineBVH(path);
+    CSourceFile source;
+    if (!OpenSource(source, path, EPackage::Kept))
+        return false;
+    if (HasExtension(source.Path(), ".bvh"))
+        exam.ExamineBVH(source.Path());
     else
-        ExamineOther(path, exam);
+        ExamineOther(source.Path(), exam);
+    return true;
 }
 
 void PrintLine(const std::string& line)
 {
     std::printf("%s\n", line.c_str());
+}
+
+// The code has a color that shows the severity.
+std::string ColoredLine(const std::string& path, const Finding& finding)
+{
+    std::string line = FindingLine(path, finding);
+    const std::string_view code = FindingCode(finding);
+    const size_t place = line.find(std::string(code) + ": ", Printable(path).size());
+    const EColor color = finding.severity == ESeverity::Error ? EColor::Red : EColor::Yellow;
+    return place == line.npos ? line : line.replace(place, code.size(), Colored(stdout, color, code));
 }
 
 // Notes are listed with the facts.
@@ -45,7 +67,7 @@ void PrintFaults(const std::string& path, const CFindings& findings)
     for (const Finding& finding : findings.Sorted())
     {
         if (finding.severity != ESeverity::Note)
-            PrintLine(FindingLine(path, finding));
+            PrintLine(ColoredLine(path, finding));
     }
 }
 
@@ -65,7 +87,6 @@ void Print(const ShellOptions& options, const std::string& path, const CFileExam
 // `fixed`: a repaired copy was written.
 void WriteFinding(CJsonWriter& json, const std::string& path, const Finding& finding, bool fixed)
 {
-    json.BreakLine();
     json.BeginObject();
     json.Key("line").Integer(static_cast<int64_t>(finding.where));
     json.Key("code").Text(FindingCode(finding));
@@ -103,10 +124,23 @@ void WriteFacts(CJsonWriter& json, const std::optional<MotionFacts>& facts)
     json.EndObject();
 }
 
+void WriteHealth(CJsonWriter& json, const std::string& path, const CFindings& findings)
+{
+    const std::vector<Finding> sorted = findings.Sorted();
+    const auto fault = std::ranges::find(sorted, ESeverity::Error, &Finding::severity);
+    if (!findings.HasFaults())
+        WriteStatus(json, "ok");
+    else if (fault == sorted.end())
+        WriteFailed(json, MakeNotice(path, sorted.front()));
+    else
+        WriteFailed(json, MakeNotice(path, *fault));
+}
+
 // Writes a file's object without its end, so that a repaired copy can be added.
 void BeginJson(CJsonWriter& json, const std::string& path, const CFileExam& exam, bool fixed)
 {
     json.BeginObject();
+    WriteHealth(json, path, exam.Findings());
     json.Key("file").Text(path);
     json.Key("healthy").Bool(!exam.Findings().HasFaults());
     json.Key("facts");
@@ -128,9 +162,25 @@ void Tell(const ShellOptions& options, const std::string& path, const CFileExam&
 EExit ExamineFile(const ShellOptions& options, const std::string& path)
 {
     CFileExam exam;
-    Examine(path, exam);
+    if (!Examine(path, exam))
+        return EExit::Failed;
     Tell(options, path, exam);
     return exam.Findings().HasFaults() ? EExit::Failed : EExit::Done;
+}
+
+void WriteSummary(size_t files, size_t faulty)
+{
+    CJsonWriter json(stdout);
+    json.BeginObject();
+    json.Key("summary").Bool(true);
+    if (faulty == 0)
+        WriteStatus(json, "ok");
+    else
+        WriteFailed(json, MakeNotice({}, "faults", std::to_string(faulty) + " files have faults"));
+    json.Key("files").Integer(static_cast<int64_t>(files));
+    json.Key("faulty").Integer(static_cast<int64_t>(faulty));
+    json.EndObject();
+    json.EndDocument();
 }
 
 bool CanFix(const ShellOptions& options)
@@ -138,7 +188,8 @@ bool CanFix(const ShellOptions& options)
     if (options.files.size() != 1)
         return Refuse("--fix needs exactly one file");
     const std::string& source = options.files[0];
-    if (!HasExtension(source, ".bvh") || !HasExtension(options.fix, ".bvh"))
+    const auto isBVH = [](const std::string& path) { return HasExtension(path, ".bvh") || IsStream(path); };
+    if (!isBVH(source) || !isBVH(options.fix))
         return Refuse("--fix writes a repaired .bvh from a .bvh");
     if (IsSameFile(source, options.fix))
         return Refuse(Printable(source) + ": a file is never repaired in place; pass another name to --fix");
@@ -175,20 +226,26 @@ EExit FixFile(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     CFileExam exam;
-    Examine(source, exam);
+    COutputFile output;
+    if (!output.Open(options, options.fix, ".bvh") || !Examine(source, exam))
+        return EExit::Failed;
     if (exam.Findings().HasFaults() && !exam.Findings().MendsAny())
     {
         Tell(options, source, exam);
-        SayError(Printable(source) + ": none of these faults can be repaired, so no copy was written");
+        SayError(source, "not-fixable", "none of these faults can be repaired, so no copy was written");
         return EExit::Failed;
     }
-    if (!exam.WriteMended(options.fix))
+    if (!exam.WriteMended(output.Path()))
     {
         SayNotWritten(options.fix);
         return EExit::Failed;
     }
     CFileExam copy;
-    Examine(options.fix, copy);
+    Examine(output.Path(), copy);
+    if (!output.DeliverOrSay())
+        return EExit::Failed;
+    if (IsStandardOutput(options.fix))
+        return copy.Findings().HasFaults() ? EExit::Failed : EExit::Done;
     TellFixed(options, exam, copy);
     return copy.Findings().HasFaults() ? EExit::Failed : EExit::Done;
 }
@@ -201,15 +258,14 @@ EExit RunDoctor(const ShellOptions& options)
     {
         if (!CanFix(options))
             return EExit::Usage;
-        return MayWrite(options, options.fix) ? FixFile(options) : EExit::Failed;
+        return FixFile(options);
     }
-    EExit exit = EExit::Done;
+    size_t faulty = 0;
     for (const std::string& path : options.files)
-    {
-        if (ExamineFile(options, path) != EExit::Done)
-            exit = EExit::Failed;
-    }
-    return exit;
+        faulty += ExamineFile(options, path) == EExit::Done ? 0 : 1;
+    if (options.json && options.files.size() > 1)
+        WriteSummary(options.files.size(), faulty);
+    return faulty == 0 ? EExit::Done : EExit::Failed;
 }
 
 } // namespace gw

@@ -6,6 +6,7 @@
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "SystemError.h"
 #include "Text.h"
 #include "TreeViewScript.h"
@@ -17,7 +18,7 @@ namespace {
 
 EExit Fail(const std::string& path, const std::string& words)
 {
-    SayError(Printable(path) + ": " + words);
+    SayError(path, "write-error", words);
     return EExit::Failed;
 }
 
@@ -35,13 +36,19 @@ bool WriteTreeView(const std::string& folder)
 EExit RunDump(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
+    if (options.outputFolder == kStandardStream)
+    {
+        SayError(
+            "--out-dir -: a dump has many pages; 'gaitwright info --json' writes the contents as one object");
+        return EExit::Usage;
+    }
     CSceneFile file;
     if (!file.LoadWhole(source))
         return EExit::Failed;
     SayWarnings(options, source, file.Record());
     const std::vector<CObject*> roots = file.Roots();
     if (roots.empty())
-        SayWord(options, "warning: " + Printable(source) + ": the file has no roots to show");
+        SayWarning(options, Printable(source) + ": the file has no roots to show");
     const std::string folder = WithSeparator(options.outputFolder);
     if (!CreateFolder(options.outputFolder))
         return Fail(folder, "the folder cannot be created" + TakeSystemErrorWords());

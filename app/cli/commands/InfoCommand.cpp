@@ -5,9 +5,12 @@
 #include "CKeyframeControl.h"
 #include "CSceneFile.h"
 #include "CommandTable.h"
+#include "FindingWords.h"
 #include "InfoContainer.h"
+#include "JsonStatus.h"
 #include "NoticeJson.h"
 #include "PackageBlocks.h"
+#include "PackagedMotion.h"
 #include "Paths.h"
 #include "Text.h"
 #include "Words.h"
@@ -40,11 +43,11 @@ Timing TrackTiming(const CKeyframeControl* track)
 }
 
 // A batch run writes packages as .orn, so the extension is not enough.
-std::string FormatOf(const std::string& path, CSceneFile& file)
+std::string FormatOf(CSceneFile& file)
 {
     if (file.IsContainer())
         return FindPackage(file.Scene()).info ? "Kinetra" : "orn";
-    return LowerCase(SplitPath(path).extension).substr(1);
+    return LowerCase(SplitPath(file.ReadPath()).extension).substr(1);
 }
 
 void PrintTiming(const Timing& timing)
@@ -80,7 +83,6 @@ void WriteBones(CJsonWriter& json, const std::vector<FoundNode>& nodes)
     json.Key("bones").BeginArray();
     for (const FoundNode& found : nodes)
     {
-        json.BreakLine();
         json.BeginObject();
         json.Key("name").Text(found.node->NameView());
         json.Key("parent");
@@ -93,13 +95,28 @@ void WriteBones(CJsonWriter& json, const std::vector<FoundNode>& nodes)
     json.EndArray();
 }
 
+void PrintClips(const ImportFacts& facts)
+{
+    for (const std::string& clip : facts.clips)
+        std::printf("clip:    %s%s\n", Printable(clip).c_str(), clip == facts.clip ? " (shown)" : "");
+}
+
+void WriteClips(CJsonWriter& json, const ImportFacts& facts)
+{
+    json.Key("clips").BeginArray();
+    for (const std::string& clip : facts.clips)
+        json.Text(clip);
+    json.EndArray();
+}
+
 void Print(const std::string& path, CSceneFile& file)
 {
-    std::printf("file:    %s\nformat:  %s\n", Printable(path).c_str(), FormatOf(path, file).c_str());
+    std::printf("file:    %s\nformat:  %s\n", Printable(path).c_str(), FormatOf(file).c_str());
     if (file.IsContainer())
         PrintContainer(file.Scene());
     const Timing timing = TrackTiming(file.FirstTrack());
-    if (!file.IsContainer() || timing.frames != 0)
+    PrintClips(file.Motion().imported);
+    if (!file.IsScene() || timing.frames != 0)
         PrintTiming(timing);
     PrintBones(file.Nodes());
     if (file.IsContainer())
@@ -110,10 +127,15 @@ void WriteJson(const std::string& path, CSceneFile& file)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
+    if (file.IsDamaged())
+        WriteFailed(json, MakeNotice(path, file.Failure()));
+    else
+        WriteStatus(json, "ok");
     json.Key("file").Text(path);
-    json.Key("format").Text(FormatOf(path, file));
+    json.Key("format").Text(FormatOf(file));
     WriteTiming(json, TrackTiming(file.FirstTrack()));
     WriteBones(json, file.Nodes());
+    WriteClips(json, file.Motion().imported);
     WriteRecord(json, path, file.Record());
     if (file.IsContainer())
         WriteContainer(json, file.Scene());
@@ -128,16 +150,27 @@ EExit RunInfo(const ShellOptions& options)
     const std::string& path = options.files[0];
     CSceneFile file;
     file.Scene().SetPictureLimit(0); // only the names of linked pictures are printed
+    file.SelectSource(options.clip, options.rate);
     if (!file.Load(path))
     {
-        SayFailure(path, file.Failure());
+        file.SayFailure(path);
         return EExit::Failed;
+    }
+    if (!file.IsDamaged())
+        file.ShowInside(options, path);
+    if (options.listClips && !options.json)
+    {
+        for (const std::string& clip : file.Motion().imported.clips)
+            std::puts(Printable(clip).c_str());
+        return EExit::Done;
     }
     if (options.json)
         WriteJson(path, file);
     else
         Print(path, file);
     SayWarnings(options, path, file.Record());
+    if (!file.IsContainer()) // a package stores the rate itself
+        SayRateOfResult(options, path, file.Motion());
     if (!file.IsDamaged())
         return EExit::Done;
     SayDamage(path, file.Failure());

@@ -79,7 +79,7 @@ bool ReadReports(const ShellOptions& options, const CRunPlan& plan, Lines& lines
     {
         if (ReadReport(path, lines))
             continue;
-        SayError(Printable(path) + ": the report cannot be read" + TakeSystemErrorWords());
+        SayError(path, "unreadable-report", "the report cannot be read" + TakeSystemErrorWords());
         return false;
     }
     for (size_t shard = 0; named.empty() && shard < plan.shardCount; ++shard)
@@ -142,7 +142,7 @@ bool Write(const ShellOptions& options, const std::string& joined)
     CSafeFile file;
     if (file.Open(options.output) && file.Write(joined) && file.Commit())
         return true;
-    SayError(Printable(options.output) + ": the report cannot be written" + TakeSystemErrorWords());
+    SayError(options.output, "write-error", "the report cannot be written" + TakeSystemErrorWords());
     return false;
 }
 

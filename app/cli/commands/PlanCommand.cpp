@@ -5,6 +5,7 @@
 #include "CRunPlan.h"
 #include "CommandTable.h"
 #include "ConversionJobs.h"
+#include "JsonStatus.h"
 #include "JsonText.h"
 #include "OptionJson.h"
 #include "Output.h"
@@ -41,12 +42,12 @@ bool MakePlan(const ShellOptions& options, const CFileRun::Jobs& jobs, CRunPlan&
     plan.shardCount = static_cast<size_t>(*options.shards);
     for (const ConversionJob& job : jobs)
     {
-        CRunPlan::Entry entry{job.source, job.output};
+        CRunPlan::Entry entry{.source = job.source, .output = job.output, .clip = job.clip};
         FileSize(job.source, entry.byteCount);
         if (!IsUtf8(entry.source) || !IsUtf8(entry.output))
         {
-            SayError(Printable(job.source) +
-                     ": the name is not valid UTF-8, which a plan needs; rename the file");
+            SayError(job.source, "bad-name",
+                     "the name is not valid UTF-8, which a plan needs; rename the file");
             return false;
         }
         plan.entries.push_back(std::move(entry));
@@ -61,6 +62,7 @@ void TellPlan(const ShellOptions& options, const CRunPlan& plan)
     {
         CJsonWriter json(stdout);
         json.BeginObject();
+        WriteStatus(json, "ok");
         json.Key("plan").Text(options.output);
         json.Key("sources").Integer(static_cast<int64_t>(plan.entries.size()));
         json.Key("shards").Integer(static_cast<int64_t>(plan.shardCount));
@@ -81,7 +83,7 @@ bool AreSourcesThere(const ShellOptions& options)
     {
         if (IsTaken(path))
             continue;
-        SayError(Printable(path) + ": no such file or folder");
+        SayError(path, "not-found", "no such file or folder");
         return false;
     }
     return true;
@@ -111,7 +113,7 @@ EExit RunPlan(const ShellOptions& options)
         return EExit::Failed;
     if (!WritePlan(options.output, plan))
     {
-        SayError(Printable(options.output) + ": the plan cannot be written" + TakeSystemErrorWords());
+        SayError(options.output, "write-error", "the plan cannot be written" + TakeSystemErrorWords());
         return EExit::Failed;
     }
     TellPlan(options, plan);

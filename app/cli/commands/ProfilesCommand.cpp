@@ -6,6 +6,7 @@
 #include "CommandTable.h"
 #include "DoubtWords.h"
 #include "FitWords.h"
+#include "JsonStatus.h"
 #include "ProfileChoice.h"
 #include "ProfileFit.h"
 #include "Text.h"
@@ -86,10 +87,10 @@ void WriteJson(const std::vector<Entry>& entries)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
+    WriteStatus(json, "ok");
     json.Key("profiles").BeginArray();
     for (const Entry& entry : entries)
     {
-        json.BreakLine();
         json.BeginObject();
         json.Key("name").Text(entry.name);
         json.Key("path").Text(entry.path);

@@ -2,6 +2,7 @@
 
 #include "Arguments.h"
 #include "CommandTable.h"
+#include "JsonStatus.h"
 #include "LiveNames.h"
 #include "SystemError.h"
 #include "Words.h"
@@ -27,7 +28,7 @@ EExit RunArguments(int argc, char** argv)
         return arguments.command ? arguments.command->run(arguments.options) : arguments.exit;
     } catch (const std::bad_alloc&)
     {
-        SayError("there is not enough memory");
+        SayError({}, "memory", "there is not enough memory");
         return EExit::Failed;
     }
 }
@@ -55,6 +56,8 @@ int RunProgram(int argc, char** argv)
     std::signal(SIGXFSZ, SIG_IGN);
 #endif
     EExit exit = RunArguments(argc, argv);
+    if (IsJsonAsked(argc, argv))
+        FinishJson(argv[1], exit);
     errno = 0;
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {

@@ -4,6 +4,7 @@
 #include "CJsonWriter.h"
 #include "CSceneFile.h"
 #include "CommandTable.h"
+#include "JsonStatus.h"
 #include "Output.h"
 #include "PackageBlocks.h"
 #include "PackagedMotion.h"
@@ -152,6 +153,7 @@ void WriteJson(const ShellOptions& options, const PictureOptions* picture)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
+    WriteStatus(json, "ok");
     json.Key("source").Text(options.files[0]);
     json.Key("output").Text(OutputOf(options));
     json.Key("outcome").Text(picture ? "drawn" : "skipped");

@@ -68,7 +68,7 @@ EExit RunShard(const ShellOptions& given)
         return EExit::Failed;
     CFileRun::Jobs jobs;
     for (CRunPlan::Entry& entry : plan.Shard(shard))
-        jobs.push_back({std::move(entry.source), std::move(entry.output)});
+        jobs.push_back({std::move(entry.source), std::move(entry.output), std::move(entry.clip)});
     return CConversionRun(options, std::move(jobs), ShardState(plan, given.files[0], shard)).RunAll();
 }
 

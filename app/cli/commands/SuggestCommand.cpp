@@ -1,16 +1,19 @@
 // `suggest`: drafts a bone map for a motion without a fitting one, writes it, and prints its rows with the
 // confidence in each, so that a user knows what to check.
 
-#include "CFileConversion.h"
 #include "CJsonWriter.h"
+#include "COutputFile.h"
 #include "CSafeFile.h"
+#include "CShellConversion.h"
 #include "CShellNotices.h"
 #include "CommandTable.h"
 #include "DoubtWords.h"
 #include "DraftedProfile.h"
+#include "JsonStatus.h"
 #include "Notice.h"
 #include "Output.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "SuggestProfile.h"
 #include "Text.h"
 #include "Words.h"
@@ -89,7 +92,6 @@ void WriteNumbers(CJsonWriter& json, const char* key, const std::array<int, 3>& 
 
 void WriteRow(CJsonWriter& json, const SuggestedRow& row)
 {
-    json.BreakLine();
     json.BeginObject();
     json.Key("target").Text(row.target);
     json.Key("source").Text(row.source ? row.source->NameView() : "");
@@ -118,6 +120,7 @@ void WriteJson(const ShellOptions& options, const std::string& name, const Sugge
 {
     CJsonWriter json(stdout);
     json.BeginObject();
+    WriteStatus(json, "ok");
     json.Key("source").Text(options.files[0]);
     json.Key("output").Text(options.output);
     json.Key("name").Text(name);
@@ -134,13 +137,13 @@ void WriteJson(const ShellOptions& options, const std::string& name, const Sugge
 // Prints which of the thirteen required joints were not found.
 EExit FailMissing(const std::string& source, const SuggestedProfile& profile)
 {
-    SayError(Printable(source) + ": " + WhyNotSure(profile));
+    SayError(source, "no-body", WhyNotSure(profile));
     for (const SuggestedRow& row : profile.rows)
     {
         if (row.kind == ESuggestedRow::NoName)
-            SayError(Printable(source) + ": the " + PlaceWords(row.place) + " would be " +
-                     Quoted(row.source->NameView()) +
-                     ", but the name of that joint cannot be used in a profile; rename it in the file");
+            SayError(source, "bad-joint-name",
+                     "the " + PlaceWords(row.place) + " would be " + Quoted(row.source->NameView()) +
+                         ", but the name of that joint cannot be used in a profile; rename it in the file");
     }
     return EExit::Failed;
 }
@@ -155,10 +158,13 @@ bool WriteProfile(const std::string& path, const std::string& text)
 }
 
 // Writes the profile and prints its rows.
-EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNode* sourceRoot)
+EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNode* sourceRoot,
+              COutputFile& output)
 {
-    const std::string name = SuggestedName(SplitPath(options.files[0]).stem);
-    if (!WriteProfile(options.output, DraftText(profile, SplitPath(options.files[0]).stem, sourceRoot)))
+    const std::string name = SuggestedName(StemOf(options.files[0]));
+    if (!WriteProfile(output.Path(), DraftText(profile, StemOf(options.files[0]), sourceRoot)))
+        return EExit::Failed;
+    if (!output.DeliverOrSay())
         return EExit::Failed;
     if (const std::optional<Notice> warning = RateWarning(options.output, sourceRoot))
         SayNotice(options, *warning);
@@ -172,7 +178,8 @@ EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNod
         WriteJson(options, name, profile);
         return EExit::Done;
     }
-    PrintRows(profile);
+    if (!IsStandardOutput(options.output))
+        PrintRows(profile);
     return TellWritten(options, options.files[0], options.output);
 }
 
@@ -180,22 +187,23 @@ EExit Deliver(const ShellOptions& options, const SuggestedProfile& profile, CNod
 
 EExit RunSuggest(const ShellOptions& options)
 {
-    if (!HasExtension(options.output, ".prf"))
+    if (!HasExtension(options.output, ".prf") && !IsStream(options.output))
     {
         SayError(Printable(options.output) + ": the name of a profile must end in .prf");
         return EExit::Usage;
     }
-    if (!MayWrite(options, options.output))
+    COutputFile output;
+    if (!output.Open(options, options.output, ".prf"))
         return EExit::Failed;
     CShellNotices notices(options);
-    CFileConversion conversion(options.dataFolder, {}, [&](const Notice& notice) { notices.Add(notice); });
-    if (!conversion.LoadSource(options.files[0]) || !conversion.LoadTarget() || notices.HasFailed())
+    CShellConversion conversion(options, {}, notices);
+    if (!conversion.ReadSource(options.files[0]) || !conversion.LoadTarget() || notices.HasFailed())
         return EExit::Failed;
     const SuggestedProfile profile =
         SuggestProfile(*conversion.SourceRoot(), *conversion.Result().motionRoot);
     if (!profile.missing.empty())
         return FailMissing(options.files[0], profile);
-    return Deliver(options, profile, conversion.SourceRoot());
+    return Deliver(options, profile, conversion.SourceRoot(), output);
 }
 
 } // namespace gw

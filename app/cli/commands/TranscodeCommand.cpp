@@ -1,12 +1,15 @@
 #include "BodyPaths.h"
 #include "CMotionFile.h"
+#include "COutputFile.h"
 #include "CommandTable.h"
 #include "FindBody.h"
 #include "GlbFile.h"
 #include "MotionFacts.h"
 #include "Notice.h"
 #include "Output.h"
+#include "PackagedMotion.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "TKBVHStream.h"
 #include "Text.h"
 #include "Words.h"
@@ -23,10 +26,22 @@ EExit Fail(const std::string& path, const Finding& failure)
     return EExit::Failed;
 }
 
+// Returns the output, or for a stream a name with the extension of its format.
+std::string OutputName(const ShellOptions& options)
+{
+    const std::string& output = options.files[1];
+    return IsStream(output) && !options.format.empty() ? '.' + options.format : output;
+}
+
+bool IsHTR(const std::string& source)
+{
+    return HasExtension(source, ".htr") || HasExtension(source, ".Kinetra") || IsStream(source);
+}
+
 bool CanTranscode(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
-    const std::string& output = options.files[1];
+    const std::string output = OutputName(options);
     if (HasExtension(output, ".bvh") || HasExtension(output, ".glb"))
     {
         if (options.frameScale == 1.0f)
@@ -34,7 +49,7 @@ bool CanTranscode(const ShellOptions& options)
         SayError("--frame-scale works only for .htr output; other formats are written frame by frame");
         return false;
     }
-    if (HasExtension(output, ".htr") && HasExtension(source, ".htr"))
+    if (HasExtension(output, ".htr") && IsHTR(source))
         return true;
     SayError(Printable(output) +
              ": an .htr can be written as .htr, .bvh or .glb, any other motion as .bvh or "
@@ -60,13 +75,15 @@ double MetersPerUnit(const CMotionFile& motion)
     return unit > 0.0 ? unit : MetersOfUnit(RestLegLength(FindBody(*motion.motionRoot).body));
 }
 
-EExit WriteAsGlb(const ShellOptions& options, const CMotionFile& motion)
+// Writes the file by its extension. If that fails, records the reason and returns false.
+bool Write(const ShellOptions& options, CMotionFile& motion, const std::string& path, CFailureRecord& record)
 {
-    const std::string& output = options.files[1];
-    CFailureRecord record;
-    if (!SaveGlb(motion, MetersPerUnit(motion), output, record))
-        return Fail(output, record.Failure());
-    return TellWritten(options, options.files[0], output);
+    if (HasExtension(path, ".htr"))
+        return motion.Save(path, options.frameScale) || record.Fail(motion.Record().Failure());
+    if (HasExtension(path, ".glb"))
+        return SaveGlb(motion, MetersPerUnit(motion), path, record);
+    TKBVHStream stream(motion);
+    return stream.WriteFile(path) || record.Fail(stream.Record().Failure());
 }
 
 } // namespace
@@ -77,29 +94,22 @@ EExit RunTranscode(const ShellOptions& options)
     const std::string& output = options.files[1];
     if (!CanTranscode(options))
         return EExit::Usage;
-    if (!MayWrite(options, output))
-        return EExit::Failed;
+    COutputFile file;
     CMotionFile motion;
-    if (!motion.Load(source))
-        return Fail(source, motion.Record().Failure());
-    SayWarnings(options, source, motion.Record());
-    if (HasExtension(output, ".htr"))
-    {
-        if (!motion.Save(output, options.frameScale))
-            return Fail(output, motion.Record().Failure());
-        return TellWritten(options, source, output);
-    }
-    if (HasExtension(output, ".glb"))
-        return WriteAsGlb(options, motion);
-    if (const char* const words = WhyNoBVH(motion))
+    if (!file.Open(options, output, SplitPath(OutputName(options)).extension) ||
+        !LoadMotion(options, source, options.rate, motion))
+        return EExit::Failed;
+    SayRateOfResult(options, source, motion);
+    const char* const words = HasExtension(file.Path(), ".bvh") ? WhyNoBVH(motion) : nullptr;
+    if (words)
     {
         SayNotice(options, MakeNotice(source, "no-bvh", words));
         return EExit::Failed;
     }
-    TKBVHStream stream(motion);
-    if (!stream.WriteFile(output))
-        return Fail(output, stream.Record().Failure());
-    return TellWritten(options, source, output);
+    CFailureRecord record;
+    if (!Write(options, motion, file.Path(), record))
+        return Fail(output, record.Failure());
+    return file.DeliverOrSay() ? TellWritten(options, source, output) : EExit::Failed;
 }
 
 } // namespace gw

@@ -7,6 +7,7 @@
 #include "ManPage.h"
 #include "Numbers.h"
 #include "OptionTable.h"
+#include "Streams.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -39,6 +40,17 @@ bool ScanNumber(std::string_view text, float& number)
     return kind == ENumber::Whole && std::isfinite(number);
 }
 
+// Returns "--output" of "-o,--output".
+std::string LongName(const OptionRow& row)
+{
+    return std::string(row.names.substr(row.names.rfind(',') + 1));
+}
+
+[[noreturn]] void RefuseValue(const OptionRow& row, const std::string& text, const char* words)
+{
+    throw CLI::ValidationError(LongName(row) + ": " + Quoted(text) + ' ' + words);
+}
+
 // Registers an option with the parser, according to the type of its value.
 class OptionBinder
 {
@@ -58,40 +70,40 @@ public:
     }
     CLI::Option* operator()(int64_t ShellOptions::*target) const
     {
-        return Add([number = &(options_.*target)](const std::string& text) {
-            if (!ScanInteger(text, *number))
-                throw CLI::ValidationError(Quoted(text) + " is not an integer");
+        return Add([&row = row_, number = &(options_.*target)](const std::string& text) {
+            if (!ScanInteger(text, *number) || *number < 0)
+                RefuseValue(row, text, "is not a whole number, 0 or more");
         });
     }
     CLI::Option* operator()(std::optional<int64_t> ShellOptions::*target) const
     {
-        return Add([number = &(options_.*target)](const std::string& text) {
+        return Add([&row = row_, number = &(options_.*target)](const std::string& text) {
             if (!ScanInteger(text, number->emplace()) || **number < 0)
-                throw CLI::ValidationError(Quoted(text) + " is not a non-negative integer");
+                RefuseValue(row, text, "is not a count");
         });
     }
     CLI::Option* operator()(PixelSize ShellOptions::*target) const
     {
-        return Add([size = &(options_.*target)](const std::string& text) {
+        return Add([&row = row_, size = &(options_.*target)](const std::string& text) {
             const std::string_view words = text;
             const size_t cross = std::min(text.find('x'), text.size());
             if (!ScanInteger(words.substr(0, cross), size->width) ||
                 !ScanInteger(words.substr(std::min(cross + 1, text.size())), size->height))
-                throw CLI::ValidationError(Quoted(text) + " is not a size such as 640x480");
+                RefuseValue(row, text, "is not a size such as 640x480");
         });
     }
     CLI::Option* operator()(float ShellOptions::*target) const
     {
-        return Add([number = &(options_.*target)](const std::string& text) {
+        return Add([&row = row_, number = &(options_.*target)](const std::string& text) {
             if (!ScanNumber(text, *number) || !(*number > 0.0f))
-                throw CLI::ValidationError(Quoted(text) + " is not a positive number");
+                RefuseValue(row, text, "is not a positive number");
         });
     }
     CLI::Option* operator()(std::optional<float> ShellOptions::*target) const
     {
-        return Add([number = &(options_.*target)](const std::string& text) {
+        return Add([&row = row_, number = &(options_.*target)](const std::string& text) {
             if (!ScanNumber(text, number->emplace()))
-                throw CLI::ValidationError(Quoted(text) + " is not a number");
+                RefuseValue(row, text, "is not a number");
         });
     }
 
@@ -122,6 +134,17 @@ CLI::Validator OneOf(std::string_view choices)
     return CLI::Validator(check, std::string(choices));
 }
 
+CLI::Validator FrameRange()
+{
+    const auto check = [](std::string& text) {
+        int64_t first = 0;
+        int64_t last = 0;
+        return ReadFrames(text, first, last) ? std::string()
+                                             : Quoted(text) + " is not a range of frames such as 10-50";
+    };
+    return CLI::Validator(check, "A-B");
+}
+
 void AddOptions(CLI::App& app, const ShellCommand& command, ShellOptions& options)
 {
     for (const OptionRow& row : OptionTable())
@@ -132,6 +155,8 @@ void AddOptions(CLI::App& app, const ShellCommand& command, ShellOptions& option
         option->required((command.required & row.bit) != 0);
         if (!row.choices.empty())
             option->check(OneOf(row.choices));
+        if (row.bit == kFrames)
+            option->check(FrameRange());
     }
     app.add_option("files", options.files);
     app.allow_extras();
@@ -166,7 +191,7 @@ EExit Refuse(std::string_view words, std::string_view nearest, const std::string
 {
     const std::string guess = nearest.empty() ? "" : "; did you mean '" + std::string(nearest) + "'?";
     SayError(std::string(words) + guess);
-    SayError(remedy);
+    SayPlain(remedy);
     return EExit::Usage;
 }
 
@@ -225,6 +250,11 @@ std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv
         return RefuseFor(command, std::string(command.name) + " needs " + std::string(command.operands));
     if (options.files.size() > MostOperands(command))
         return RefuseFor(command, "unexpected argument: " + Quoted(options.files[MostOperands(command)]));
+    if (options.rate > 0.0f && !std::isfinite(1.0f / options.rate))
+        return RefuseFor(command, "--rate: the number is too small for a rate");
+    const std::string& output = options.output.empty() ? options.fix : options.output;
+    if (options.json && IsStandardOutput(output))
+        return RefuseFor(command, "--json and the result would both go to standard output");
     options.draft = options.draft || !options.drafts.empty();
     return std::nullopt;
 }
@@ -260,12 +290,29 @@ EExit ParseWithoutCommand(std::string_view word, std::string_view next)
             return Print(row.text());
     }
     const std::string remedy = "'gaitwright --help' lists the commands";
+    const bool isHelp = word == "help";
+    if (isHelp && next.empty())
+        return Print(ProgramHelp());
+    if (const auto command = std::ranges::find(Commands(), next, &ShellCommand::name);
+        isHelp && command != Commands().end())
+        return Print(CommandHelp(*command));
+    if (isHelp)
+        return Refuse("unknown command " + Quoted(next), NearestName(next, CommandNames()), remedy);
     if (word.empty())
         return Refuse("missing command", {}, remedy);
     return Refuse("unknown command " + Quoted(word), NearestName(word, CommandNames()), remedy);
 }
 
 } // namespace
+
+bool ReadFrames(std::string_view text, int64_t& first, int64_t& last)
+{
+    const size_t dash = std::min(text.find('-'), text.size());
+    if (!ScanInteger(text.substr(0, dash), first))
+        return false;
+    last = first;
+    return dash == text.size() || (ScanInteger(text.substr(dash + 1), last) && first <= last);
+}
 
 Arguments ParseArguments(int argc, char** argv)
 {

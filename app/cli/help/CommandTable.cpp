@@ -23,7 +23,8 @@ constexpr uint64_t kManyOptions = kJobs | kFilesFrom | kNull | kResume | kReport
 constexpr uint64_t kHelpOptions = kAlign | kFaithful | kNoHands | kDraft | kDrafts | kMend | kCheck;
 
 constexpr uint64_t kConvertOptions = kOutput | kOutputFolder | kProfile | kNoLegs | kHelpOptions | kForce |
-                                     kSkipExisting | kDryRun | kKeepGoing | kHtml | kManyOptions;
+                                     kSkipExisting | kDryRun | kKeepGoing | kHtml | kManyOptions | kRate |
+                                     kClip | kFormat | kFrames | kInPlace | kMirror;
 
 constexpr uint64_t kBatchOptions = kJob | kProfile | kOutputFolder | kHelpOptions | kKeepGoing | kManyOptions;
 
@@ -42,16 +43,21 @@ constexpr ShellCommand kCommands[] = {
         "best: all of its rows must match, and the most rows win. The result line names the chosen profile\n"
         "and its confidence. A profile that confuses left and right, or arm and clavicle, is used only if\n"
         "you name it. If the names in the source share a prefix (Model_, mixamorig3:), it is added to those\n"
-        "of the profile.\n"
+        "of the profile.\n\n"
         "--draft makes a profile if no installed one fits, as 'gaitwright suggest' does. --mend reads a\n"
-        "damaged .bvh file repaired, as 'gaitwright doctor --fix' does. The result line says so.\n"
-        "If OUT ends in .htr, only the motion file is written. Several sources, or a folder, need "
+        "damaged .bvh file repaired, as 'gaitwright doctor --fix' does. The result line says so.\n\n"
+        "OUT can end in .Kinetra, .htr, .bvh or .glb, or be a folder; --format selects the same. SOURCE and "
+        "OUT\n"
+        "can be - for standard input and output. --frames, --in-place and --mirror change the result after\n"
+        "it was measured. Of a file with several clips, the longest is converted unless you pass --clip; in\n"
+        "a folder, each clip becomes a result.\n\n"
+        "Several sources, or a folder, need "
         "--out-dir;\n"
         "results keep the folder structure of their sources. A folder gives all motion files in it, except\n"
         "hidden ones. Many files are converted by several processes: one that crashes or hangs loses only\n"
         "its own file. The first failure ends the run unless you pass --keep-going. Results and messages "
         "are\n"
-        "the same for any number of processes. The run ends with a summary; --verbose prints each result.\n"
+        "the same for any number of processes. The run ends with a summary; --verbose prints each result.\n\n"
         "--align first re-expresses the source relative to a T-pose, like 'gaitwright align'. Every mapped\n"
         "bone then points as in the source. Only the names in the profile are used, because its rotations\n"
         "and axes were made for the source's own rest pose.\n"
@@ -82,16 +88,21 @@ constexpr ShellCommand kCommands[] = {
         "-o, the lines go to standard output. A source without a line is unfinished: run its shard again.\n"
         "--html writes the page of a single run; it shows details of sources that are on this machine.",
         "gaitwright merge-report plan.jsonl -o report.jsonl"),
-    Row("info", "FILE", 0, 0, RunInfo,
-        "Show what a motion or a container contains: format, frames, rate, bones, objects.",
+    Row("info", "FILE", kClip | kRate | kListClips, 0, RunInfo,
+        "Show what a motion or a container contains: format, frames, rate, clips, bones, objects.\n"
+        "Frames and bones of a Kinetra file are those of the motion inside.",
         "gaitwright info walk.bvh"),
-    Row("pose", "FILE", kFrame | kTime | kObjects, 0, RunPose,
-        "Print the local and world matrix of every node at a frame or a time, as JSON.\n"
+    Row("pose", "FILE", kFrame | kTime | kAll | kObjects | kOutput | kForce | kClip | kRate, 0, RunPose,
+        "Print the local and world matrix of every node at a frame or a time, as JSON, or write all poses.\n"
         "Matrices are for row vectors and are written row by row. A frame past the end gives the last pose.\n"
+        "--all writes world matrices of every frame: OUT.csv has a row per frame and bone, OUT.npy the "
+        "shape\n"
+        "frames x bones x 4 x 4, with the positions and the names of the bones in two more files.\n"
         "--objects prints all placed objects: bounds, points, normals, texture coordinates, cameras, lights.",
-        "gaitwright pose walk.bvh --frame 30", kFrame | kTime),
-    Row("transcode", "IN OUT", kFrameScale | kForce, 0, RunTranscode,
-        "Write an .htr with more or fewer frames, or any motion as a .bvh.",
+        "gaitwright pose walk.bvh --frame 30", kFrame | kTime | kAll),
+    Row("transcode", "IN OUT", kFrameScale | kForce | kFormat | kClip | kRate, 0, RunTranscode,
+        "Write an .htr with more or fewer frames, or any motion as .bvh or .glb.\n"
+        "IN and OUT can be - for standard input and output; then --format selects the format.",
         "gaitwright transcode walk.htr slow.htr --frame-scale 2"),
     Row("align", "SOURCE", kOutput | kProfile | kForce, kOutput, RunAlign,
         "Write a motion as a .bvh with the same joints in the same places, relative to a T-pose.\n"

@@ -49,6 +49,13 @@ enum EOption : uint64_t
     kDrafts = 1ull << 35,
     kMend = 1ull << 36,
     kVerbose = 1ull << 37,
+    kFormat = 1ull << 38,
+    kFrames = 1ull << 39,
+    kInPlace = 1ull << 40,
+    kMirror = 1ull << 41,
+    kClip = 1ull << 42,
+    kListClips = 1ull << 43,
+    kAll = 1ull << 44,
     kView = 1ull << 50,
     kBackground = 1ull << 51,
     kUpright = 1ull << 52,
@@ -59,9 +66,9 @@ enum EOption : uint64_t
 /// Options that control how a run works, but not what a source is converted to. All others are part of a
 /// plan, and of what --resume compares: one too many there costs time, one too few would keep outdated
 /// results.
-inline constexpr uint64_t kHowToRun = kOutput | kOutputFolder | kForce | kSkipExisting | kDryRun |
-                                      kKeepGoing | kDataFolder | kJson | kQuiet | kVerbose | kJobs |
-                                      kFilesFrom | kNull | kResume | kReport | kTimeLimit | kShards | kShard;
+inline constexpr uint64_t kHowToRun =
+    kOutput | kOutputFolder | kForce | kSkipExisting | kDryRun | kKeepGoing | kDataFolder | kJson | kQuiet |
+    kVerbose | kJobs | kFilesFrom | kNull | kResume | kReport | kTimeLimit | kShards | kShard | kFormat;
 
 /// One command of the program.
 struct ShellCommand

@@ -2,6 +2,13 @@
 
 #include "OptionTable.h"
 
+#include "CProgressBar.h"
+#include "Text.h"
+
+#include <algorithm>
+
+#include <unistd.h>
+
 namespace gw {
 
 namespace {
@@ -15,7 +22,7 @@ constexpr OptionRow Row(EOption bit, std::string_view names, std::string_view va
 }
 
 constexpr OptionRow kOptions[] = {
-    Row(kOutput, "-o,--output", "OUT", &ShellOptions::output, "the file to write"),
+    Row(kOutput, "-o,--output", "OUT", &ShellOptions::output, "the file to write; - for standard output"),
     Row(kOutputFolder, "--out-dir", "DIR", &ShellOptions::outputFolder,
         "the folder to write to, created if it is missing"),
     Row(kProfile, "--profile", "NAME|FILE", &ShellOptions::profile,
@@ -29,6 +36,8 @@ constexpr OptionRow kOptions[] = {
     Row(kJob, "--job", "htr|orn", &ShellOptions::job,
         "htr converts every .bvh file, orn packages every .htr file", "htr|orn"),
     Row(kFrame, "--frame", "N", &ShellOptions::frame, "frame number, starting at 0"),
+    Row(kAll, "--all", "", &ShellOptions::all,
+        "write every frame to OUT: .csv, or .npy with OUT.positions.npy and OUT.names.txt"),
     Row(kTime, "--time", "T", &ShellOptions::time,
         "time in the units of the file's controls; may be negative"),
     Row(kObjects, "--objects", "", &ShellOptions::objects, "print all placed objects, not only nodes"),
@@ -36,6 +45,20 @@ constexpr OptionRow kOptions[] = {
     Row(kWith, "--with", "RESULT", &ShellOptions::with,
         "a second motion to draw next to it, at the same fraction of its length"),
     Row(kStrip, "--strip", "N", &ShellOptions::strip, "draw N poses in a row; a second motion goes below"),
+    Row(kRate, "--rate", "R", &ShellOptions::rate,
+        "frames per second, in place of the rate in the source; for 'package', the rate to store"),
+    Row(kClip, "--clip", "NAME", &ShellOptions::clip,
+        "the clip to read from an .fbx, .gltf, .glb, .vrm or .dae file (default: the longest)"),
+    Row(kListClips, "--list-clips", "", &ShellOptions::listClips,
+        "print the names of the clips, one per line"),
+    Row(kFormat, "--format", "kinetra|htr|bvh|glb", &ShellOptions::format,
+        "format of the result (default: by the name of the output, otherwise kinetra)",
+        "kinetra|htr|bvh|glb"),
+    Row(kFrames, "--frames", "A-B", &ShellOptions::frames,
+        "write only these frames of the source; the first frame is 0"),
+    Row(kInPlace, "--in-place", "", &ShellOptions::inPlace,
+        "cancel the horizontal travel of the result; the height is kept"),
+    Row(kMirror, "--mirror", "", &ShellOptions::mirror, "exchange left and right in the result"),
     Row(kAnimate, "--animate", "OUT", &ShellOptions::animate,
         "write an animated .png from the frame to the end of the motion, instead of -o"),
     Row(kView, "--view", "front|side|three-quarter|top", &ShellOptions::view,
@@ -46,7 +69,6 @@ constexpr OptionRow kOptions[] = {
     Row(kUpright, "--upright", "", &ShellOptions::upright,
         "turn a motion with another up axis than Y, such as Z, upright"),
     Row(kAxes, "--axes", "", &ShellOptions::axes, "draw the axes of every bone: X red, Y green, Z blue"),
-    Row(kRate, "--rate", "R", &ShellOptions::rate, "frames per second to store in the package"),
     Row(kFrameScale, "--frame-scale", "F", &ShellOptions::frameScale,
         "write F times as many frames over the same time"),
     Row(kFix, "--fix", "OUT", &ShellOptions::fix,
@@ -94,6 +116,33 @@ constexpr OptionRow kOptions[] = {
 
 constexpr size_t kColumn = 26; // start of the second column of a help text
 
+constexpr size_t kUsualWidth = 100; // of files and pipes
+constexpr size_t kLeastWidth = 50;  // narrower columns are harder to read than wrapped lines
+
+size_t HelpWidth()
+{
+    return isatty(STDOUT_FILENO) != 0 ? std::max(TerminalWidth(STDOUT_FILENO), kLeastWidth) : kUsualWidth;
+}
+
+// Breaks a paragraph into lines that fit; those after the first are indented. Its own line breaks count as
+// blanks.
+std::string Wrapped(std::string_view text, size_t indent)
+{
+    const size_t width = HelpWidth();
+    std::string wrapped;
+    size_t column = indent;
+    for (std::string_view word = NextToken(text, " \n"); !word.empty(); word = NextToken(text, " \n"))
+    {
+        const bool isFirst = wrapped.empty();
+        const bool fits = isFirst || column + 1 + word.size() < width;
+        if (!isFirst)
+            wrapped += fits ? " " : '\n' + std::string(indent, ' ');
+        column = (fits ? column + (isFirst ? 0 : 1) : indent) + word.size();
+        wrapped += word;
+    }
+    return wrapped;
+}
+
 void AppendRow(std::string& text, std::string_view left, std::string_view right)
 {
     std::string line = "  " + std::string(left);
@@ -101,7 +150,7 @@ void AppendRow(std::string& text, std::string_view left, std::string_view right)
         line += '\n' + std::string(kColumn, ' ');
     else
         line.resize(kColumn, ' ');
-    text += line + std::string(right) + '\n';
+    text += line + Wrapped(right, kColumn) + '\n';
 }
 
 // Returns an option's names and value as shown in usage lines and help texts.
@@ -168,7 +217,15 @@ std::string ProgramHelp()
 
 std::string CommandHelp(const ShellCommand& command)
 {
-    std::string text = "Usage: " + UsageLine(command) + "\n\n" + std::string(command.help) + "\n\nOptions:\n";
+    const std::string_view first = FirstLine(command.help);
+    std::string text = "Usage: " + UsageLine(command) + "\n\n" + Wrapped(first, 0) + '\n';
+    for (std::string_view rest = command.help.substr(first.size()); !rest.empty();)
+    {
+        const size_t end = std::min(rest.find("\n\n", 1), rest.size());
+        text += '\n' + Wrapped(rest.substr(0, end), 0) + '\n';
+        rest.remove_prefix(end);
+    }
+    text += "\nOptions:\n";
     for (const OptionRow& row : kOptions)
     {
         if (OptionsOf(command) & row.bit)

@@ -3,6 +3,7 @@
 #include <cstdint>
 #include <optional>
 #include <string>
+#include <string_view>
 #include <vector>
 
 namespace gw {
@@ -35,6 +36,9 @@ struct ShellOptions
     std::string drafts;       ///< --drafts, the folder that keeps drafted profiles; empty to keep none
     std::string dataFolder;   ///< replaces the folder next to the executable; empty for that folder
     std::string job;          ///< htr or orn
+    std::string format;       ///< --format, of a result; empty if the name of the output decides
+    std::string frames;       ///< --frames, "A-B"; empty for all
+    std::string clip;         ///< --clip, in a file with several; empty for the longest
     std::string html;         ///< --html, the page to write; empty for no page
     std::string fix;          ///< --fix, the repaired copy to write; empty for no copy
     /// --files-from, a list of sources; "-" for standard input, empty for no list
@@ -52,7 +56,7 @@ struct ShellOptions
     std::string view = "front";       ///< direction of a picture: front, side, three-quarter or top
     std::string background = "light"; ///< of a picture: light or dark
     std::string animate;              ///< --animate, the animated picture to write; empty for none
-    float rate = 0.0f;                ///< frames per second
+    float rate = 0.0f;                ///< frames per second; 0 for those of the source
     float frameScale = 1.0f;          ///< factor for the number of frames
 
     bool json = false;
@@ -74,6 +78,13 @@ struct ShellOptions
     bool upright = false;       ///< turn a motion whose up axis is not Y in a picture
     bool axes = false;          ///< draw the axes of every bone
     bool objects = false;       ///< print all spatial objects, not only nodes
+    bool all = false;           ///< write all frames
+    bool inPlace = false;       ///< cancel the horizontal travel of a result
+    bool mirror = false;        ///< exchange left and right in a result
+    bool listClips = false;     ///< print only the names of clips
 };
+
+/// Reads a range of frames, "A-B" or "A". Returns false if the text is not one.
+bool ReadFrames(std::string_view text, int64_t& first, int64_t& last);
 
 } // namespace gw

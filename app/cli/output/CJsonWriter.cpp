@@ -1,5 +1,5 @@
-// A streaming JSON writer. Strings are escaped by the JSON library; structure and line breaks are written
-// here.
+// A streaming JSON writer. Strings are escaped by the JSON library; structure and line breaks are
+// written here.
 
 #include "CJsonWriter.h"
 

@@ -33,7 +33,8 @@ public:
     void Null() { Plain("null"); }
     void Numbers(std::span<const float> values);
 
-    /// Starts a new line before the next value of an array, or its end.
+    /// Starts a new line before the next value of an array, or its end, for people and line tools. Not for
+    /// documents that programs read line by line.
     void BreakLine() { m_bBreak = true; }
     /// Ends a document with a line end; another can follow.
     void EndDocument();

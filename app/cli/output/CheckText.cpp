@@ -100,7 +100,7 @@ void PrintCheck(const MeasuredConversion& measured, std::string_view title)
 
 void WriteCheck(CJsonWriter& json, const MeasuredConversion& measured)
 {
-    WriteMeasures(json, measured.sums, ERecordLayout::OneLine);
+    WriteMeasures(json, measured.sums);
     WriteParts(json, measured.detail.parts);
     WriteKneePops(json, measured.sums.feet);
     WriteWorst(json, FindWorstFrames(measured.sums, measured.detail, kWorstFrames));

@@ -2,6 +2,7 @@
 
 #include "CJsonWriter.h"
 #include "ConversionMeasures.h"
+#include "JsonStatus.h"
 #include "Text.h"
 
 #include <cstdio>
@@ -153,13 +154,11 @@ void Write(CJsonWriter& json, const SlideMeasures& slide)
 
 template <class Record, size_t count>
 void WriteList(CJsonWriter& json, const char* name, const std::vector<Record>& records,
-               const FigureRow<Record> (&rows)[count], ERecordLayout layout)
+               const FigureRow<Record> (&rows)[count])
 {
     json.Key(name).BeginArray();
     for (const Record& record : records)
     {
-        if (layout == ERecordLayout::Lines)
-            json.BreakLine();
         json.BeginObject();
         WriteFigures(json, record, rows);
         json.EndObject();
@@ -247,17 +246,18 @@ void WriteMeasures(const ConversionMeasures& measures)
 {
     CJsonWriter json(stdout);
     json.BeginObject();
-    WriteMeasures(json, measures, ERecordLayout::Lines);
+    WriteStatus(json, "ok");
+    WriteMeasures(json, measures);
     json.EndObject();
     json.EndDocument();
 }
 
-void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecordLayout layout)
+void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures)
 {
     WriteFigures(json, measures, kFigures);
-    WriteList(json, "bones", measures.bones, kBoneFigures, layout);
-    WriteList(json, "feet", measures.feet, kFootFigures, layout);
-    WriteList(json, "hands", measures.hands, kHandFigures, layout);
+    WriteList(json, "bones", measures.bones, kBoneFigures);
+    WriteList(json, "feet", measures.feet, kFootFigures);
+    WriteList(json, "hands", measures.hands, kHandFigures);
 }
 
 } // namespace gw

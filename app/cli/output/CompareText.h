@@ -1,18 +1,9 @@
 #pragma once
 
-#include <cstdint>
-
 namespace gw {
 
 class CJsonWriter;
 struct ConversionMeasures;
-
-/// How a list of records is laid out in JSON.
-enum class ERecordLayout : uint8_t
-{
-    Lines,   ///< one line per record, for readability
-    OneLine, ///< everything on one line, for one-line documents
-};
 
 /// Prints the figures of a conversion to standard output as a table.
 void PrintMeasures(const ConversionMeasures& measures);
@@ -21,6 +12,6 @@ void PrintSums(const ConversionMeasures& measures, const char* indent);
 /// Writes all figures to standard output as JSON; missing ones are null.
 void WriteMeasures(const ConversionMeasures& measures);
 /// Writes the same as members of an open JSON object.
-void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures, ERecordLayout layout);
+void WriteMeasures(CJsonWriter& json, const ConversionMeasures& measures);
 
 } // namespace gw

@@ -68,7 +68,6 @@ void WriteMembers(CJsonWriter& json, CObject& object, EDescribe what, const CObj
 
 void WriteObject(CJsonWriter& json, CObject& object, bool isRoot, const CObjectNumbers& numbers)
 {
-    json.BreakLine();
     json.BeginObject();
     json.Key("id").Integer(static_cast<int64_t>(numbers.at(&object)));
     json.Key("class").Text(object.GetRTTI()->m_pcName);

@@ -2,7 +2,9 @@
 
 #include "CJsonWriter.h"
 #include "CSafeFile.h"
+#include "JsonStatus.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
@@ -61,6 +63,8 @@ bool IsSameFile(const std::string& a, const std::string& b)
 
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path)
 {
+    if (path == "-")
+        return MakeNotice(path, "no-stream", "this cannot be written to standard output; name a file");
     if (FolderExists(path))
         return MakeNotice(path, "folder", "this is a folder; name the file to write");
     if (options.force)
@@ -82,20 +86,31 @@ bool MayWrite(const ShellOptions& options, const std::string& path)
     return !refusal;
 }
 
+void PrintResult(const ShellOptions& options, const std::string& output, const std::string& line)
+{
+    if (options.quiet)
+        return;
+    if (IsStandardOutput(output))
+        SayWord(options, line);
+    else
+        std::puts(line.c_str());
+}
+
 EExit TellWritten(const ShellOptions& options, const std::string& source, const std::string& output)
 {
     if (options.json)
     {
         CJsonWriter json(stdout);
         json.BeginObject();
+        WriteStatus(json, "ok");
         json.Key("source").Text(source);
         json.Key("output").Text(output);
         json.EndObject();
         json.EndDocument();
     }
-    else if (!options.quiet)
+    else
     {
-        std::printf("%s -> %s\n", Printable(source).c_str(), Printable(output).c_str());
+        PrintResult(options, output, Printable(source) + " -> " + Printable(output));
     }
     return EExit::Done;
 }

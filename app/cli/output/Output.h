@@ -27,6 +27,8 @@ bool IsSameFile(const std::string& a, const std::string& b);
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path);
 /// Returns whether a command may write a file; prints an error if not.
 bool MayWrite(const ShellOptions& options, const std::string& path);
+/// Prints a line about an output: to standard output, unless that is the output, otherwise to standard error.
+void PrintResult(const ShellOptions& options, const std::string& output, const std::string& line);
 /// Prints which source was written to which output. Returns Done.
 EExit TellWritten(const ShellOptions& options, const std::string& source, const std::string& output);
 

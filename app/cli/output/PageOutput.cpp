@@ -27,7 +27,7 @@ bool HasPageFolder(const ShellOptions& options)
     const std::string folder = SplitPath(options.html).folder;
     if (options.dryRun || folder.empty() || FolderExists(folder))
         return true;
-    SayError(Printable(options.html) + ": no such folder");
+    SayError(options.html, "no-folder", "no such folder");
     return false;
 }
 
@@ -35,8 +35,8 @@ bool WritePage(const ShellOptions& options, CConversionPage& page)
 {
     if (!page.Write(options.html))
     {
-        SayError(Printable(options.html) + ": the page, or one of its temporary files, cannot be written" +
-                 TakeSystemErrorWords());
+        SayError(options.html, "write-error",
+                 "the page, or one of its temporary files, cannot be written" + TakeSystemErrorWords());
         return false;
     }
     SayWord(options, "page: " + Printable(options.html));

@@ -1,6 +1,7 @@
 #include "Words.h"
 
 #include "CFailureRecord.h"
+#include "Color.h"
 #include "FindingWords.h"
 #include "Notice.h"
 #include "ShellOptions.h"
@@ -11,11 +12,67 @@
 
 namespace gw {
 
+namespace {
+
+constexpr std::string_view kProgramPrefix = "gaitwright:";
+
+Notice& KeptError()
+{
+    static Notice error;
+    return error;
+}
+
+void Keep(const Notice& error)
+{
+    if (KeptError().words.empty())
+        KeptError() = error;
+}
+
+// One write per line, so that lines of several programs on one terminal do not interleave.
+void Say(std::string_view prefix, std::string_view words)
+{
+    const std::string line = std::string(prefix) + ' ' + std::string(words) + '\n';
+    std::fwrite(line.data(), 1, line.size(), stderr);
+}
+
+void SayRed(std::string_view words)
+{
+    Say(Colored(stderr, EColor::Red, kProgramPrefix), words);
+}
+
+void SayKept(const Notice& error)
+{
+    Keep(error);
+    SayRed(NoticeLine(error));
+}
+
+} // namespace
+
 void SayError(std::string_view words)
 {
-    // One write per line, so that lines of several programs on one terminal do not interleave.
-    const std::string line = "gaitwright: " + std::string(words) + '\n';
-    std::fwrite(line.data(), 1, line.size(), stderr);
+    Keep(MakeNotice({}, "", std::string(words)));
+    SayRed(words);
+}
+
+void SayError(const std::string& path, const char* code, const std::string& words)
+{
+    SayKept(MakeNotice(path, code, words));
+}
+
+const Notice& FirstError()
+{
+    return KeptError();
+}
+
+void SayPlain(std::string_view words)
+{
+    Say(kProgramPrefix, words);
+}
+
+void SayWarning(const ShellOptions& options, std::string_view words)
+{
+    if (!options.quiet)
+        Say(Colored(stderr, EColor::Yellow, std::string(kProgramPrefix) + " warning:"), words);
 }
 
 bool Refuse(std::string_view words)
@@ -27,20 +84,20 @@ bool Refuse(std::string_view words)
 void SayWord(const ShellOptions& options, std::string_view words)
 {
     if (!options.quiet)
-        SayError(words);
+        SayPlain(words);
 }
 
 void SayNotice(const ShellOptions& options, const Notice& notice)
 {
     if (notice.IsWarning())
-        SayWord(options, "warning: " + NoticeLine(notice));
+        SayWarning(options, NoticeLine(notice));
     else
-        SayError(NoticeLine(notice));
+        SayKept(notice);
 }
 
 void SayFailure(const std::string& path, const Finding& failure)
 {
-    SayError(NoticeLine(MakeNotice(path, failure)));
+    SayKept(MakeNotice(path, failure));
 }
 
 void SayNotWritten(const std::string& path)
@@ -57,7 +114,9 @@ void SayWarnings(const ShellOptions& options, const std::string& path, const CFa
 void SayDamage(const std::string& path, const Finding& failure)
 {
     const std::string place = failure.where == 0 ? "" : " at byte " + std::to_string(failure.where);
-    SayError(Printable(path) + ": damaged" + place + ": " + MakeNotice(path, failure).words);
+    const Notice notice = MakeNotice(path, failure);
+    Keep(notice);
+    SayRed(Printable(path) + ": damaged" + place + ": " + notice.words);
 }
 
 } // namespace gw

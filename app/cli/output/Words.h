@@ -12,6 +12,14 @@ struct ShellOptions;
 
 /// Prints a line to standard error, after the program's name. Names from files must already be printable.
 void SayError(std::string_view words);
+/// Prints a line that is not an error of its own.
+void SayPlain(std::string_view words);
+/// Prints a warning; prints nothing with --quiet.
+void SayWarning(const ShellOptions& options, std::string_view words);
+/// Prints an error about a file. `code` is fixed and for programs: "no-folder".
+void SayError(const std::string& path, const char* code, const std::string& words);
+/// Returns the first error that this process has printed; without words if there is none.
+const Notice& FirstError();
 /// Same for an invalid command line. Always returns false, so that a check can return the result.
 bool Refuse(std::string_view words);
 /// Same for information that is not a failure; prints nothing with --quiet.

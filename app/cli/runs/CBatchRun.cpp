@@ -7,6 +7,7 @@
 #include "CShellConversion.h"
 #include "CShellNotices.h"
 #include "CheckText.h"
+#include "JsonStatus.h"
 #include "NoticeJson.h"
 #include "StringTable.h"
 #include "Text.h"
@@ -70,6 +71,8 @@ CFileRun::FileEnd CBatchRun::Convert(const ShellOptions& options, size_t index, 
     const bool good = step == EBatchStep::Done && std::ranges::all_of(notices, &Notice::IsWarning);
     const EConversion outcome = good ? EConversion::Converted : EConversion::Failed;
     WriteRecord(index, outcome, notices, record);
+    if (options.json)
+        WriteRecord(index, outcome, notices, stdout);
     if (check_ && IsEachTold() && !options.quiet && !options.json)
         PrintCheck(*check_, "check");
     const bool endsRun = step != EBatchStep::Done && !options.keepGoing;
@@ -85,6 +88,7 @@ void CBatchRun::WriteRecord(size_t index, EConversion outcome, std::span<const N
     json.Key("source").Text(AllJobs()[index].source);
     json.Key("output").Text(AllJobs()[index].output);
     json.Key("outcome").Text(OutcomeName(outcome));
+    WriteStatus(json, OutcomeName(outcome), {notices.begin(), notices.end()});
     json.Key("profile").Text(converts ? conversion_.Profile().name : "");
     json.Key("profilePath").Text(converts ? conversion_.ProfilePath() : "");
     json.Key("frames").Integer(converts ? conversion_.Result().GetKeyCount() : 0);
@@ -102,6 +106,8 @@ void CBatchRun::TellLost(size_t index, const Notice& reason, std::FILE* record)
     if (Voice() != EVoice::Silent)
         SayNotice(Options(), reason);
     WriteRecord(index, EConversion::Failed, {&reason, 1}, record);
+    if (Options().json)
+        WriteRecord(index, EConversion::Failed, {&reason, 1}, stdout);
 }
 
 void CBatchRun::TellUpToDate(size_t index)

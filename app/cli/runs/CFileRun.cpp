@@ -98,7 +98,7 @@ bool CFileRun::OpenReport()
     }
     if (m_kReport.Open(options_.report, CReportFile::EStart::Empty))
         return true;
-    SayError(Printable(options_.report) + ": the report cannot be written" + TakeSystemErrorWords());
+    SayError(options_.report, "write-error", "the report cannot be written" + TakeSystemErrorWords());
     return false;
 }
 
@@ -131,9 +131,9 @@ bool CFileRun::OpenState()
     m_kResume.Read(m_kState.folder);
     if (options_.dryRun || m_kResume.Open(m_kState.folder, m_kState.name))
         return true;
-    SayError(Printable(m_kState.folder) +
-             ": the records of the run cannot be written here, so --resume cannot work" +
-             TakeSystemErrorWords());
+    SayError(m_kState.folder, "write-error",
+             "the records of the run cannot be written here, so --resume cannot work" +
+                 TakeSystemErrorWords());
     return false;
 }
 
@@ -151,14 +151,14 @@ EExit CFileRun::Finish(bool ran, int requests)
 {
     m_kTally.left = m_kJobs.size() - std::accumulate(m_kTally.ended.begin(), m_kTally.ended.end(), size_t{0});
     if (!ran)
-        SayError("no worker process can be started; a smaller --jobs may help");
+        SayError({}, "no-worker", "no worker process can be started; a smaller --jobs may help");
     if (requests > 0)
-        SayError("interrupted");
+        SayError({}, "interrupted", "interrupted");
     const bool isSynced = SyncResults();
     const bool good = TellEnd() && isSynced;
     if (m_bReportFailed)
-        SayError(Printable(options_.report) + ": the end of the report cannot be written" +
-                 SystemErrorWords(m_iReportError));
+        SayError(options_.report, "write-error",
+                 "the end of the report cannot be written" + SystemErrorWords(m_iReportError));
     if (requests > 0)
         return EExit::Interrupted;
     return good && ran && !m_bReportFailed ? EExit::Done : EExit::Failed;
@@ -172,8 +172,9 @@ bool CFileRun::SyncResults()
     const std::string failed = m_kSync.Sync();
     const bool isSynced = failed.empty();
     if (!isSynced)
-        SayError(Printable(failed) + ": the disk reports a failed write" + TakeSystemErrorWords() +
-                 "; this result or others of the run may be damaged");
+        SayError(failed, "write-error",
+                 "the disk reports a failed write" + TakeSystemErrorWords() +
+                     "; this result or others of the run may be damaged");
     const bool isNews = m_kTally[EConversion::Converted] > 0 || m_kResume.HasUnsynced();
     if (isSynced && isNews && options_.resume && !options_.dryRun)
         m_kResume.AddSynced();

@@ -8,6 +8,7 @@
 #include "CProgressBar.h"
 #include "FindingWords.h"
 #include "HelpWords.h"
+#include "JsonStatus.h"
 #include "NoticeJson.h"
 #include "NoticeKinds.h"
 #include "ProfileNames.h"
@@ -80,7 +81,7 @@ void SayKinds(const char* title, const Kinds& kinds)
         rows.push_back({kind.sources, kind.words});
     std::ranges::stable_sort(rows, std::ranges::greater(), &KindRow::sources);
     if (!rows.empty())
-        SayError(title);
+        SayPlain(title);
     for (size_t i = 0; i < std::min(rows.size(), kNamedKinds); ++i)
     {
         char count[32];
@@ -140,6 +141,8 @@ void CRunSummary::TakeCause(const std::string& source, const std::vector<Notice>
         found != notices.end() ? *found : MakeNotice(source, "unknown", "the cause is unknown");
     m_uiMendable += NamesMending(cause) ? 1 : 0;
     m_kCauses[cause.code].Add(cause);
+    if (m_uiFailed == 0)
+        m_kFirst = cause;
     ++m_uiFailed;
     if (m_kFailed.size() < kNamedFailures)
         m_kFailed.push_back(FirstLine(NoticeLine(cause)));
@@ -201,14 +204,14 @@ void CRunSummary::Say(const ShellOptions& options, const RunTally& tally, bool a
 void CRunSummary::SayHelp(const ShellOptions& options) const
 {
     if (!options.draft && (m_kCauses.contains("misfit") || m_kCauses.contains("doubtful")))
-        SayError("--draft makes profiles for skeletons that no installed one fits");
+        SayPlain("--draft makes profiles for skeletons that no installed one fits");
     if (!options.mend && m_uiMendable > 0)
-        SayError("--mend reads " + std::to_string(m_uiMendable) + " of the failed files repaired");
+        SayPlain("--mend reads " + std::to_string(m_uiMendable) + " of the failed files repaired");
 }
 
 void CRunSummary::SayBetter() const
 {
-    SayError("directions, feet or the floor are far off in " + std::to_string(m_uiBetter) +
+    SayPlain("directions, feet or the floor are far off in " + std::to_string(m_uiBetter) +
              " of the results; --align --faithful would give (measured, on average):");
     for (const FigureWords& figure : kBetterFigures)
     {
@@ -226,7 +229,7 @@ void CRunSummary::SayBetter() const
 void CRunSummary::SayFailures() const
 {
     if (m_uiFailed > 0)
-        SayError("failed:");
+        SayPlain("failed:");
     for (const std::string& line : m_kFailed)
         SayLine(line);
     if (m_uiFailed > m_kFailed.size())
@@ -234,11 +237,25 @@ void CRunSummary::SayFailures() const
                 " more; a report (--report FILE) lists all, and so does --verbose");
 }
 
+// A failure of the run itself matters more than that of a source.
+Notice CRunSummary::CauseOf(const RunTally& tally) const
+{
+    if (!FirstError().words.empty())
+        return FirstError();
+    return m_uiFailed > 0 ? m_kFirst
+                          : MakeNotice({}, "unfinished", std::to_string(tally.left) + " sources are left");
+}
+
 void CRunSummary::WriteJson(const ShellOptions& options, const RunTally& tally) const
 {
     CJsonWriter json(stdout);
     json.BeginObject();
-    WriteTally(json, tally);
+    json.Key("summary").Bool(true);
+    if (tally[EConversion::Failed] + tally.left == 0 && FirstError().words.empty())
+        WriteStatus(json, "ok");
+    else
+        WriteFailed(json, CauseOf(tally));
+    WriteTally(json, options, tally);
     if (options.draft)
         json.Key("drafted").Integer(static_cast<int64_t>(m_uiDrafted));
     if (options.mend)

@@ -1,5 +1,6 @@
 #pragma once
 
+#include "Notice.h"
 #include "RunTally.h"
 
 #include <map>
@@ -10,7 +11,6 @@
 namespace gw {
 
 class CJsonWriter;
-struct Notice;
 
 /// What a run over many files amounts to, on one screen: how many sources had which outcome, why sources
 /// failed, the first failures with their causes, and how many sources had which warnings.
@@ -49,11 +49,13 @@ private:
     void SayHelp(const ShellOptions& options) const;
     void SayBetter() const;
     void SayFailures() const;
+    Notice CauseOf(const RunTally& tally) const;
     void WriteJson(const ShellOptions& options, const RunTally& tally) const;
 
     Kinds m_kCauses;
     Kinds m_kWarnings;
     std::vector<std::string> m_kFailed; ///< the first ones, one line each
+    Notice m_kFirst;                    ///< cause of the first one
     size_t m_uiFailed = 0;
     size_t m_uiDrafted = 0;
     size_t m_uiMended = 0;

@@ -4,6 +4,9 @@
 #include "CSceneFile.h"
 
 #include "CKeyframeControl.h"
+#include "EditMotion.h"
+#include "PackageBlocks.h"
+#include "PackagedMotion.h"
 #include "Paths.h"
 #include "Words.h"
 
@@ -26,11 +29,48 @@ bool IsUnreachable(EFailure reason)
 
 } // namespace
 
+void CSceneFile::SelectSource(const std::string& clip, float rate)
+{
+    m_kMotion.importChoice = {clip, rate};
+    m_fRate = rate;
+}
+
 bool CSceneFile::Load(const std::string& path)
 {
+    m_kStreamFailure = {};
+    if (!m_kSource.Open(path))
+    {
+        m_kStreamFailure = m_kSource.Failure();
+        return false;
+    }
+    const bool isLoaded = LoadFile(m_kSource.Path());
+    if (isLoaded && !m_bContainer && m_fRate > 0.0f)
+        SetFrameTime(*m_kMotion.motionRoot, 1.0f / m_fRate);
+    return isLoaded;
+}
+
+void CSceneFile::ShowInside(const ShellOptions& options, const std::string& path)
+{
+    const PackageBlocks blocks = m_bContainer ? FindPackage(m_kScene) : PackageBlocks();
+    if (!blocks.info)
+        return;
+    std::optional<Notice> failure = WhyNotUnpacked(path, m_kScene, m_kMotion);
+    m_bInside = !failure;
+    if (failure)
+    {
+        failure->severity = ESeverity::Warning;
+        failure->words = "the motion inside cannot be read: " + failure->words;
+        SayNotice(options, *failure);
+    }
+    else if (m_fRate > 0.0f)
+        SetFrameTime(*m_kMotion.motionRoot, 1.0f / m_fRate);
+}
+
+bool CSceneFile::LoadFile(const std::string& path)
+{
     m_bContainer = HasContainerName(path);
-    if (!m_bContainer && (m_kMotion.Load(path) || Failure().reason != EFailure::UnknownFormat))
-        return !Failure();
+    if (!m_bContainer && (m_kMotion.Load(path) || Record().Failure().reason != EFailure::UnknownFormat))
+        return !Record().Failure();
     const bool isContainer = m_kScene.LoadFile(path, false);
     // A file that cannot be opened should not be reported as an unknown format.
     m_bContainer = m_bContainer || isContainer || IsUnreachable(m_kScene.Record().Failure().reason);
@@ -40,15 +80,23 @@ bool CSceneFile::Load(const std::string& path)
 bool CSceneFile::LoadWhole(const std::string& path)
 {
     if (!Load(path))
-        SayFailure(path, Failure());
+        SayFailure(path);
     else if (IsDamaged())
         SayDamage(path, Failure());
-    return !Failure();
+    return m_kStreamFailure.words.empty() && !Failure();
+}
+
+void CSceneFile::SayFailure(const std::string& path) const
+{
+    if (m_kStreamFailure.words.empty())
+        gw::SayFailure(path, Failure());
+    else
+        SayError(path, m_kStreamFailure.code.c_str(), m_kStreamFailure.words);
 }
 
 std::vector<CObject*> CSceneFile::Roots() const
 {
-    if (!m_bContainer)
+    if (!IsScene())
         return {m_kMotion.motionRoot.Get()};
     std::vector<CObject*> roots;
     for (size_t i = 0; i < m_kScene.GetRootCount(); ++i)
@@ -97,7 +145,7 @@ const CKeyframeControl* CSceneFile::FirstTrack()
 
 std::vector<CObject*> CSceneFile::Objects()
 {
-    if (m_bContainer)
+    if (IsScene())
         return m_kScene.ObjectsInSaveOrder();
     COrrinStream motion;
     motion.AddRoot(m_kMotion.motionRoot.Get());

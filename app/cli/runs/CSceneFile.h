@@ -2,6 +2,7 @@
 
 #include "CMotionFile.h"
 #include "COrrinStream.h"
+#include "CSourceFile.h"
 
 #include <cstddef>
 #include <cstdint>
@@ -11,6 +12,7 @@
 namespace gw {
 
 class CKeyframeControl;
+struct ShellOptions;
 
 /// A node found by a tree walk, and its parent, or null for a root.
 struct FoundNode
@@ -29,6 +31,16 @@ public:
     /// read as far as possible: see IsDamaged.
     bool Load(const std::string& path);
 
+    /// Selects what Load reads, as CFileConversion::SelectSource.
+    void SelectSource(const std::string& clip, float rate);
+    /// Shows the motion inside a Kinetra file, if this is one. If it cannot be read, prints a warning.
+    void ShowInside(const ShellOptions& options, const std::string& path);
+    /// Returns whether the roots and nodes are those of a container.
+    bool IsScene() const { return m_bContainer && !m_bInside; }
+
+    /// Prints why Load failed.
+    void SayFailure(const std::string& path) const;
+
     /// Same for commands that need the whole file. Returns false, after printing what is wrong, for a damaged
     /// file too.
     bool LoadWhole(const std::string& path);
@@ -38,6 +50,8 @@ public:
     const CFailureRecord& Record() const { return m_bContainer ? m_kScene.Record() : m_kMotion.Record(); }
     const Finding& Failure() const { return Record().Failure(); }
 
+    /// Returns the file that was read: the source, or a temporary copy.
+    const std::string& ReadPath() const { return m_kSource.Path(); }
     const CMotionFile& Motion() const { return m_kMotion; }
     COrrinStream& Scene() { return m_kScene; }
 
@@ -55,7 +69,13 @@ public:
     std::vector<CObject*> Objects();
 
 private:
+    bool LoadFile(const std::string& path);
+
+    CSourceFile m_kSource;
+    float m_fRate = 0.0f;
     bool m_bContainer = false;
+    Notice m_kStreamFailure; ///< without words unless a source could not be copied
+    bool m_bInside = false;  ///< the motion is that inside the container
     CMotionFile m_kMotion;
     COrrinStream m_kScene;
 };

@@ -18,6 +18,7 @@
 #include "ProfileFit.h"
 #include "ProfileNames.h"
 #include "ShellOptions.h"
+#include "Streams.h"
 #include "StringTable.h"
 #include "SuggestProfile.h"
 #include "SystemError.h"
@@ -64,12 +65,42 @@ CShellConversion::CShellConversion(const ShellOptions& options, const Conversion
 
 bool CShellConversion::ReadSource(const std::string& path)
 {
-    if (!options_.mend || m_kMended.Mend(path))
-        return LoadSource(path, m_kMended.Path());
+    SelectSource(options_.clip, options_.rate);
+    if (!m_kSource.Open(path, EPackage::Unpacked))
+    {
+        Notify(m_kSource.Failure());
+        return false;
+    }
+    if (!options_.mend || m_kMended.Mend(m_kSource.Path()))
+        return LoadSource(path, ReadPath());
     Notify(MakeNotice(path, "no-mended-copy",
                       "a repaired copy cannot be written to the folder for temporary files" +
                           TakeSystemErrorWords()));
     return false;
+}
+
+MotionEdits CShellConversion::Edits() const
+{
+    MotionEdits edits{.inPlace = options_.inPlace, .mirror = options_.mirror};
+    if (!options_.frames.empty())
+        ReadFrames(options_.frames, edits.firstFrame, edits.lastFrame);
+    return edits;
+}
+
+bool CShellConversion::WriteEdited(const std::string& path, bool* taken)
+{
+    const MotionEdits edits = Edits();
+    if (edits.firstFrame >= Result().GetKeyCount())
+    {
+        Notify(MakeNotice(SourcePath(), "no-such-frame",
+                          "--frames " + options_.frames + ": the motion has " +
+                              std::to_string(Result().GetKeyCount()) + " frames, starting at 0"));
+        return false;
+    }
+    const CEditedMotion edited(Result(), edits);
+    if (HasExtension(path, ".bvh") || HasExtension(path, ".glb"))
+        return WriteExchange(path, taken);
+    return WriteResult(path, taken);
 }
 
 bool CShellConversion::Open(const std::string& path)
@@ -264,7 +295,7 @@ bool CShellConversion::UseDraft()
         m_bDraftUnsure = draft.missing.empty() && !m_kWhyNoDraft.empty();
         if (!m_kWhyNoDraft.empty())
             return false;
-        const std::string stem = SplitPath(SourcePath()).stem;
+        const std::string stem = StemOf(SourcePath());
         path = m_pkDrafts->Keep(skeleton, FirstCharacters(stem, kStemCharacters),
                                 DraftText(draft, stem, SourceRoot()));
     }
@@ -280,7 +311,7 @@ bool CShellConversion::UseDraft()
 void CShellConversion::NotifyWithDraft(Notice notice) const
 {
     const std::string source = ShellWord(SourcePath());
-    const std::string map = ShellWord(SplitPath(SourcePath()).stem + ".prf");
+    const std::string map = ShellWord(StemOf(SourcePath()) + ".prf");
     notice = WithHelp(options_, std::move(notice));
     if (!m_kWhyNoDraft.empty())
         notice.words += "\n  no draft was used: " + m_kWhyNoDraft;

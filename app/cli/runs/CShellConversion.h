@@ -3,6 +3,7 @@
 #include "CFileConversion.h"
 #include "CMendedSource.h"
 #include "CProfileTexts.h"
+#include "CSourceFile.h"
 #include "ChooseProfile.h"
 #include "ProfileFit.h"
 
@@ -63,6 +64,13 @@ public:
     bool IsDrafted() const { return m_bDrafted; }
     /// Returns the copy that was read in place of the source, and what was repaired in it.
     const CMendedSource& Mended() const { return m_kMended; }
+    /// Returns the file that was read: the source, or a copy that exists as long as the conversion.
+    const std::string& ReadPath() const { return m_kMended.IsMended() ? m_kMended.Path() : m_kSource.Path(); }
+    /// Saves the result in the format of the extension, changed as the options say. `taken` as for
+    /// WriteResult.
+    bool WriteEdited(const std::string& path, bool* taken = nullptr);
+    /// Returns the changes that the options ask for.
+    MotionEdits Edits() const;
     /// Returns how well the closest profile fits if none fits fully.
     const std::optional<CProfileFit>& Nearest() const { return nearest_; }
     /// Measures how a profile fits the open source. Returns false if its file cannot be read.
@@ -86,6 +94,7 @@ private:
     std::optional<std::vector<InstalledProfile>> installed_; ///< set when first needed
     std::optional<ProfileChoice> chosen_;
     std::optional<CProfileFit> nearest_;
+    CSourceFile m_kSource;
     CMendedSource m_kMended;
     CDraftShelf* m_pkDrafts = nullptr;
     bool m_bDrafted = false;

@@ -5,6 +5,7 @@
 #include "HelpWords.h"
 #include "Words.h"
 
+#include <string>
 #include <vector>
 
 namespace gw {
@@ -24,13 +25,21 @@ public:
 
     void Add(const Notice& told)
     {
-        const Notice notice = WithHelp(options_, told);
+        Notice notice = WithHelp(options_, told);
+        if (!copy_.empty() && notice.path == copy_)
+            notice.path = name_;
         if (voice_ == EVoice::Speaks || (voice_ == EVoice::Failures && !notice.IsWarning()))
             SayNotice(options_, notice);
         if (notice.code == kFixedMessage)
             return;
         notices_.push_back(notice);
         hasFailed_ = hasFailed_ || !notice.IsWarning();
+    }
+    /// Replaces the path of a temporary file in all notices by a name that the user knows.
+    void ShowAs(const std::string& copy, const std::string& name)
+    {
+        copy_ = copy;
+        name_ = name;
     }
     /// Changes which notices are printed; all are still kept.
     void SetVoice(EVoice voice) { voice_ = voice; }
@@ -43,6 +52,8 @@ public:
 private:
     const ShellOptions& options_;
     std::vector<Notice> notices_;
+    std::string copy_;
+    std::string name_;
     bool hasFailed_ = false;
     EVoice voice_;
 };

@@ -48,7 +48,8 @@ std::optional<MeasuredConversion> MeasureAnew(const ShellOptions& options, const
                                               const ConversionJob& job, const CShellConversion& done)
 {
     CFileConversion conversion(options.dataFolder, choices, [](const Notice&) {});
-    if (!conversion.LoadSource(job.source, done.Mended().Path()) || !conversion.LoadTarget())
+    conversion.SelectSource(options.clip, options.rate);
+    if (!conversion.LoadSource(job.source, done.ReadPath()) || !conversion.LoadTarget())
         return std::nullopt;
     conversion.UseProfile(done.ProfilePath(), done.Profile());
     if (!conversion.Convert(!options.noLegs))

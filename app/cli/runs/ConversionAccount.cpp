@@ -7,9 +7,12 @@
 #include "CShellNotices.h"
 #include "CheckText.h"
 #include "DoubtWords.h"
+#include "JsonStatus.h"
 #include "NoticeJson.h"
+#include "Output.h"
 #include "ProfileChoice.h"
 #include "ShellOptions.h"
+#include "Streams.h"
 #include "Text.h"
 
 namespace gw {
@@ -52,15 +55,14 @@ std::string ProfileWords(const ConversionAccount& account)
     return words;
 }
 
-void Print(const ConversionJob& job, const ConversionAccount& account)
+std::string ResultLine(const ConversionJob& job, const ConversionAccount& account)
 {
     const std::string paths = Printable(job.source) + " -> " + Printable(job.output);
     if (account.outcome == EConversion::Skipped)
-        std::printf("%s: skipped, %s\n", paths.c_str(), account.whySkipped);
-    else if (account.outcome == EConversion::Planned)
-        std::printf("%s: would be converted by %s\n", paths.c_str(), ProfileWords(account).c_str());
-    else if (account.outcome == EConversion::Converted)
-        std::printf("%s: %d frames by %s\n", paths.c_str(), account.frames, ProfileWords(account).c_str());
+        return paths + ": skipped, " + account.whySkipped;
+    if (account.outcome == EConversion::Planned)
+        return paths + ": would be converted by " + ProfileWords(account);
+    return paths + ": " + std::to_string(account.frames) + " frames by " + ProfileWords(account);
 }
 
 void WriteProfile(CJsonWriter& json, const ConversionAccount& account)
@@ -78,6 +80,14 @@ void WriteProfile(CJsonWriter& json, const ConversionAccount& account)
         WriteVerdict(json, account.chosen->verdict);
 }
 
+void WriteOutcome(CJsonWriter& json, const ConversionAccount& account, const CShellNotices& notices)
+{
+    if (account.outcome == EConversion::Failed)
+        WriteStatus(json, OutcomeName(account.outcome), notices.All());
+    else
+        WriteStatus(json, OutcomeName(account.outcome));
+}
+
 void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob& job,
                const ConversionAccount& account, const CShellNotices& notices)
 {
@@ -86,6 +96,9 @@ void WriteJson(std::FILE* file, const ShellOptions& options, const ConversionJob
     json.Key("source").Text(job.source);
     json.Key("output").Text(job.output);
     json.Key("outcome").Text(OutcomeName(account.outcome));
+    WriteOutcome(json, account, notices);
+    if (!options.clip.empty())
+        json.Key("clip").Text(options.clip);
     WriteProfile(json, account);
     WriteNotices(json, notices.All());
     if (account.misfit)
@@ -115,8 +128,9 @@ void TellAccount(const ShellOptions& options, const ConversionJob& job, const Co
         WriteJson(stdout, options, job, account, notices);
     if (options.json || options.quiet || notices.Voice() != EVoice::Speaks)
         return;
-    Print(job, account);
-    if (options.check)
+    if (account.outcome != EConversion::Failed)
+        PrintResult(options, job.output, ResultLine(job, account));
+    if (options.check && !IsStandardOutput(job.output))
         PrintChecks(account);
 }
 

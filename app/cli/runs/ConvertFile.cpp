@@ -7,6 +7,7 @@
 #include "CContentHash.h"
 #include "CDraftShelf.h"
 #include "CNode.h"
+#include "COutputFile.h"
 #include "CPagePart.h"
 #include "CShellConversion.h"
 #include "CShellNotices.h"
@@ -15,6 +16,7 @@
 #include "Output.h"
 #include "Paths.h"
 #include "ResultSize.h"
+#include "Streams.h"
 #include "Words.h"
 
 #include <algorithm>
@@ -25,7 +27,7 @@ namespace gw {
 
 namespace {
 
-constexpr const char* kOutcomeNames[] = {"converted", "planned", "skipped", "failed"};
+constexpr const char* kOutcomeNames[] = {"converted", "would_convert", "skipped", "failed"};
 
 // Keeps a motion reachable until exit instead of freeing it: the system frees a whole process faster, and
 // deleting object by object takes three percent of a small conversion. Only for the last work of a process,
@@ -38,6 +40,27 @@ void KeepUntilExit(CNode* root)
         return;
     root->Retain();
     *free = root;
+}
+
+int FrameCount(const MotionEdits& edits, int all)
+{
+    const int64_t end = std::min<int64_t>(edits.lastFrame, all - 1) + 1;
+    return static_cast<int>(std::max<int64_t>(end - edits.firstFrame, 0));
+}
+
+// A pipe or device is not a result of an earlier run.
+bool IsSkipped(const ShellOptions& options, const std::string& output)
+{
+    return options.skipExisting && IsTaken(output) && !IsStream(output);
+}
+
+std::optional<Notice> WhyNotConvert(const ShellOptions& options, const ConversionJob& job)
+{
+    if (IsStream(job.output))
+        return std::nullopt;
+    if (IsSameFile(job.source, job.output))
+        return MakeNotice(job.output, "own-source", "this is the source; choose another name for the result");
+    return WhyNotWrite(options, job.output);
 }
 
 // Runs one job in steps. Each step returns whether the next one may run.
@@ -56,7 +79,7 @@ public:
     /// For a process's only conversion.
     void KeepMotionsUntilExit() const
     {
-        if (HasExtension(job_.source, ".orn"))
+        if (HasExtension(m_kConversion.ReadPath(), ".orn"))
             return;
         KeepUntilExit(m_kConversion.SourceRoot());
         KeepUntilExit(m_kConversion.Result().motionRoot.Get());
@@ -70,15 +93,21 @@ public:
             return EConversion::Planned;
         if (!Convert())
             return EConversion::Failed;
+        COutputFile output;
+        if (!output.Open(job_.output, ResultExtension(options_)))
+            return Fail(output.Failure());
+        notices_.ShowAs(output.Path(), job_.output);
         // Another run may have made it meanwhile, such as the workers of a killed one, and may do so until
         // the end.
-        bool taken = options_.skipExisting && IsTaken(job_.output);
+        bool taken = IsSkipped(options_, job_.output);
         const bool written =
-            !taken && m_kConversion.WriteResult(job_.output, options_.skipExisting ? &taken : nullptr);
+            !taken && m_kConversion.WriteEdited(output.Path(), options_.skipExisting ? &taken : nullptr);
         if (taken)
             return EConversion::Skipped;
         if (!written || notices_.HasFailed())
             return EConversion::Failed;
+        if (!output.Deliver())
+            return Fail(output.Failure());
         if (IsMeasured())
             Check();
         return EConversion::Converted;
@@ -93,6 +122,11 @@ public:
     }
 
 private:
+    EConversion Fail(const Notice& reason)
+    {
+        notices_.Add(reason);
+        return EConversion::Failed;
+    }
     bool SelectProfile();
     bool Convert();
     // A later run with --resume may write a report, so measure for it.
@@ -150,7 +184,8 @@ bool CJobSteps::Convert()
     }
     if (notices_.HasFailed())
         return false;
-    account_.frames = m_kConversion.Result().GetKeyCount();
+    const MotionEdits edits = m_kConversion.Edits();
+    account_.frames = FrameCount(edits, m_kConversion.Result().GetKeyCount());
     return m_kConversion.HasFrames();
 }
 
@@ -187,9 +222,9 @@ void CJobSteps::CheckOtherOptions()
 EConversion Decide(const ShellOptions& options, const ConversionJob& job, CShellNotices& notices,
                    ConversionAccount& account, const ConversionTools& tools)
 {
-    if (options.skipExisting && IsTaken(job.output))
+    if (IsSkipped(options, job.output))
         return EConversion::Skipped;
-    const std::optional<Notice> refusal = WhyNotWrite(options, job.output);
+    const std::optional<Notice> refusal = WhyNotConvert(options, job);
     if (refusal)
     {
         notices.Add(*refusal);
@@ -209,8 +244,11 @@ const char* OutcomeName(EConversion outcome)
     return kOutcomeNames[static_cast<size_t>(outcome)];
 }
 
-EConversion ConvertFile(const ShellOptions& options, const ConversionJob& job, const ConversionTools& tools)
+EConversion ConvertFile(const ShellOptions& given, const ConversionJob& job, const ConversionTools& tools)
 {
+    ShellOptions options = given;
+    if (!job.clip.empty())
+        options.clip = job.clip;
     CShellNotices notices(options, tools.voice);
     ConversionAccount account;
     account.outcome = Decide(options, job, notices, account, tools);

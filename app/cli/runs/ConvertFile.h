@@ -18,6 +18,7 @@ struct ConversionJob
 {
     std::string source;
     std::string output;
+    std::string clip = {}; ///< of a source with several clips; empty for the longest
 };
 
 enum class EConversion : uint8_t

@@ -31,11 +31,11 @@ std::string PlanWords(const std::string& path, const Finding& failure)
 bool LoadPlan(const std::string& path, CRunPlan& plan)
 {
     if (const Finding failure = ReadPlan(path, plan))
-        SayError(PlanWords(Printable(path), failure));
+        SayError({}, "unreadable-plan", PlanWords(Printable(path), failure));
     else if (plan.version != GAITWRIGHT_VERSION)
-        SayError(Printable(path) + ": version " + Printable(plan.version) +
-                 " made this plan, and this is version " + GAITWRIGHT_VERSION +
-                 "; create it again, because results could differ");
+        SayError(path, "plan-version",
+                 "version " + Printable(plan.version) + " made this plan, and this is version " +
+                     GAITWRIGHT_VERSION + "; create it again, because results could differ");
     else
         return true;
     return false;

@@ -2,6 +2,7 @@
 
 #include "Output.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
@@ -41,8 +42,8 @@ bool AreOutputsApart(const CFileRun::Jobs& jobs)
     {
         if (outputs.insert(job.output).second)
             continue;
-        SayError(Printable(job.source) + ": another source would also be written to " +
-                 Printable(job.output));
+        SayError(job.source, "output-conflict",
+                 "another source would also be written to " + Printable(job.output));
         return false;
     }
     return true;
@@ -50,9 +51,15 @@ bool AreOutputsApart(const CFileRun::Jobs& jobs)
 
 bool MakeOutputFolder(const ShellOptions& options)
 {
+    if (options.outputFolder == kStandardStream || options.drafts == kStandardStream)
+    {
+        SayError(std::string(kStandardStream), "no-stream",
+                 "a folder is needed; only a single result can be a stream");
+        return false;
+    }
     if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
         return true;
-    SayError(Printable(options.outputFolder) + ": the folder cannot be created" + TakeSystemErrorWords());
+    SayError(options.outputFolder, "no-folder", "the folder cannot be created" + TakeSystemErrorWords());
     return false;
 }
 

@@ -20,9 +20,9 @@ std::string TallyWords(const ShellOptions& options, const RunTally& tally)
            std::to_string(tally[EConversion::Failed]) + " failed, " + std::to_string(tally.left) + " left";
 }
 
-void WriteTally(CJsonWriter& json, const RunTally& tally)
+void WriteTally(CJsonWriter& json, const ShellOptions& options, const RunTally& tally)
 {
-    json.Key("converted").Integer(static_cast<int64_t>(Converted(tally)));
+    json.Key(options.dryRun ? "would_convert" : "converted").Integer(static_cast<int64_t>(Converted(tally)));
     json.Key("skipped").Integer(static_cast<int64_t>(tally[EConversion::Skipped]));
     json.Key("failed").Integer(static_cast<int64_t>(tally[EConversion::Failed]));
     json.Key("left").Integer(static_cast<int64_t>(tally.left));

@@ -24,6 +24,6 @@ struct RunTally
 /// Returns "8 converted, 2 skipped, 0 failed, 0 left".
 std::string TallyWords(const ShellOptions& options, const RunTally& tally);
 /// Writes the same as members of an open JSON object.
-void WriteTally(CJsonWriter& json, const RunTally& tally);
+void WriteTally(CJsonWriter& json, const ShellOptions& options, const RunTally& tally);
 
 } // namespace gw

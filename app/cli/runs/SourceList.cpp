@@ -6,6 +6,7 @@
 #include "CMappedFile.h"
 #include "Paths.h"
 #include "SourceTree.h"
+#include "Streams.h"
 #include "SystemError.h"
 #include "Text.h"
 #include "Words.h"
@@ -38,25 +39,32 @@ std::string Joined(std::span<const std::string> steps)
     return path;
 }
 
-std::string ReadStandardInput()
+// Reads a list from standard input, or from a pipe.
+bool ReadStream(const std::string& path, std::string& text)
 {
-    std::string text;
+    std::FILE* const stream = path == kStandardStream ? stdin : std::fopen(path.c_str(), "re");
+    if (!stream)
+        return false;
+    constexpr size_t kLimit = size_t{1} << 30; // far above any list, and ends a stream without end
     char piece[65536];
-    while (const size_t count = std::fread(piece, 1, sizeof piece, stdin))
+    while (const size_t count = text.size() < kLimit ? std::fread(piece, 1, sizeof piece, stream) : 0)
         text.append(piece, count);
-    return text;
+    const bool isRead = std::ferror(stream) == 0 && text.size() < kLimit;
+    if (stream != stdin)
+        std::fclose(stream);
+    return isRead;
 }
 
 bool ReadList(const ShellOptions& options, std::vector<std::string>& paths)
 {
     CMappedFile file;
-    const bool isInput = options.filesFrom == "-";
-    if (!isInput && file.Open(options.filesFrom) != EFailure::None)
+    std::string input;
+    const bool isInput = IsStream(options.filesFrom);
+    if (isInput ? !ReadStream(options.filesFrom, input) : file.Open(options.filesFrom) != EFailure::None)
     {
-        SayError(Printable(options.filesFrom) + ": the list cannot be read" + TakeSystemErrorWords());
+        SayError(options.filesFrom, "unreadable-list", "the list cannot be read" + TakeSystemErrorWords());
         return false;
     }
-    const std::string input = isInput ? ReadStandardInput() : std::string();
     std::string_view rest = isInput ? std::string_view(input) : file.Text();
     std::string_view line;
     while (options.nullSeparated ? !(line = NextToken(rest, std::string_view("\0", 1))).empty()

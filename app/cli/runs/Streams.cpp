@@ -1,0 +1,88 @@
+#include "Streams.h"
+
+#include "Paths.h"
+#include "ShellOptions.h"
+
+#include <algorithm>
+
+#include <sys/stat.h>
+
+namespace gw {
+
+namespace {
+
+// Redirected to a file, these are links to it. The file belongs to the shell that opened it, and must not be
+// replaced by another one.
+constexpr std::string_view kDescriptors[] = {"/dev/fd/", "/proc/self/fd/", "/dev/stdin", "/dev/stdout",
+                                             "/dev/stderr"};
+
+constexpr std::string_view kContainerMark = "TKOrrin Version";
+constexpr std::string_view kPackageMark = "MotionInfo"; // the name of a block at the start
+
+struct ContentRow
+{
+    std::string_view mark;
+    size_t within; ///< the mark lies in this many bytes
+    std::string_view extension;
+};
+constexpr size_t kAnywhere = size_t{1} << 16;
+constexpr ContentRow kContents[] = {
+    {kContainerMark,            32,        ".orn" },
+    {"glTF",                    4,         ".glb" },
+    {"VersionNumber",           24,        ".chb" },
+    {"FBX",                     64,        ".fbx" },
+    {"<COLLADA",                kAnywhere, ".dae" },
+    {"[SegmentNames&Hierarchy", kAnywhere, ".htr" },
+    {"HIERARCHY\n",             kAnywhere, ".bvh" },
+    {"HIERARCHY\r",             kAnywhere, ".bvh" },
+    {"HIERARCHY ",              kAnywhere, ".bvh" },
+    {"[HEADER]",                kAnywhere, ".cha" },
+    {"\"asset\"",               kAnywhere, ".gltf"},
+};
+
+} // namespace
+
+bool IsStream(const std::string& path)
+{
+    if (path == kStandardStream ||
+        std::ranges::any_of(kDescriptors, [&](std::string_view name) { return path.starts_with(name); }))
+        return true;
+    struct stat status;
+    return stat(path.c_str(), &status) == 0 && !S_ISREG(status.st_mode) && !S_ISDIR(status.st_mode);
+}
+
+bool IsStandardOutput(const std::string& path)
+{
+    return path == kStandardStream || path == "/dev/stdout" || path == "/dev/fd/1" ||
+           path == "/proc/self/fd/1";
+}
+
+std::string_view ResultExtension(const ShellOptions& options)
+{
+    static constexpr std::string_view kExtensions[] = {".htr", ".bvh", ".glb"};
+    for (const std::string_view extension : kExtensions)
+    {
+        if (extension.substr(1) == options.format)
+            return extension;
+    }
+    return ".Kinetra";
+}
+
+std::string StemOf(const std::string& source)
+{
+    return source == kStandardStream ? "stdin" : SplitPath(source).stem;
+}
+
+std::string_view ExtensionOfContent(std::string_view start)
+{
+    if (start.starts_with(kContainerMark) && start.find(kPackageMark) != start.npos)
+        return ".Kinetra";
+    for (const ContentRow& row : kContents)
+    {
+        if (start.substr(0, row.within).find(row.mark) != start.npos)
+            return row.extension;
+    }
+    return {};
+}
+
+} // namespace gw

@@ -1,0 +1,78 @@
+"""Standard input and output, pipes and devices as sources and results."""
+import os
+import signal
+import subprocess
+import threading
+
+from harness import ASSETS, FAILED, PROGRAM, USAGE, WALK, CliTest, main
+
+
+class Streams(CliTest):
+    def setUp(self):
+        super().setUp()
+        self.write("walk.bvh", WALK.read_bytes())
+        for name in ("walk.htr", "walk.Kinetra"):
+            self.succeed("convert", "walk.bvh", "-o", name)
+
+    def test_a_stream_gives_the_bytes_of_a_file(self):
+        self.succeed("align", "walk.bvh", "-o", "aligned.bvh")
+        self.succeed("transcode", "walk.htr", "walk-2.bvh")
+        rows = [  # arguments, source, the file with the same bytes as standard output
+            ("convert -", "walk.bvh", "walk.Kinetra"),
+            ("convert - -o - --format htr", "walk.bvh", "walk.htr"),
+            ("convert /dev/stdin -o - --format htr", "walk.bvh", "walk.htr"),
+            ("extract - -o -", "walk.Kinetra", "walk.htr"),
+            ("align - -o -", "walk.bvh", "aligned.bvh"),
+            ("transcode - - --format bvh", "walk.htr", "walk-2.bvh"),
+            ("doctor - --fix -", "walk.bvh", "walk.bvh"),
+        ]
+        known = self.files()
+        for line, source, expected in rows:
+            with self.subTest(line):
+                result = self.succeed(*line.split(), given=self.read(source))
+                self.assertEqual(result.bytes, self.read(expected))
+                self.assertEqual(self.files(), known)
+        for command in ("info", "doctor"):
+            named, piped = (self.with_assets(command, name, given=self.read("walk.bvh")).out
+                            for name in ("walk.bvh", "-"))
+            self.assertEqual(named.replace("walk.bvh", "-"), piped)
+
+    def test_pipes_and_devices_are_written_and_stay(self):
+        for name in ("in", "out"):
+            os.mkfifo(self.folder / name)
+        writer = threading.Thread(target=lambda: (self.folder / "in").write_bytes(WALK.read_bytes()))
+        taken = []
+        reader = threading.Thread(target=lambda: taken.append((self.folder / "out").read_bytes()))
+        for thread in (writer, reader):
+            thread.start()
+        self.succeed("convert", "in", "-o", "out", "--format", "htr")
+        for thread in (writer, reader):
+            thread.join()
+        self.assertEqual(taken, [self.read("walk.htr")])
+        known = self.files()
+        self.succeed("convert", "walk.bvh", "-o", "/dev/null")
+        full = self.with_assets("convert", "walk.bvh", "-o", "/dev/full")
+        self.assertEqual(full.code, FAILED)
+        self.assert_words(full, ["/dev/full", "No space left on device"])
+        self.assertEqual(self.files(), known)
+
+    def test_what_no_stream_can_be_is_refused(self):
+        for line, code in (("convert -", FAILED), ("info /dev/zero", FAILED),
+                           ("plan walk.bvh --shards 1 -o -", FAILED), ("convert - walk.bvh --out-dir d", USAGE),
+                           ("dump walk.Kinetra --out-dir -", USAGE)):
+            with self.subTest(line):
+                self.assertEqual(self.with_assets(*line.split()).code, code)
+                self.assertFalse([name for name in self.files() if name.split("/")[-1].startswith("-")])
+
+    def test_a_reader_that_leaves_ends_the_program_and_leaves_no_file(self):
+        self.environment["TMPDIR"] = str(self.folder)
+        known = self.files()
+        with subprocess.Popen([PROGRAM, "convert", "walk.bvh", "-o", "-", "--data-dir", ASSETS], cwd=self.folder,
+                              env=self.environment, stdout=subprocess.PIPE, stderr=subprocess.DEVNULL) as run:
+            run.stdout.close()
+            self.assertEqual(run.wait(), -signal.SIGPIPE)
+        self.assertEqual(self.files(), known)
+
+
+if __name__ == "__main__":
+    main()
