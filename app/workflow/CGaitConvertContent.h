@@ -1,8 +1,8 @@
 #pragma once
 
 #include "CConversion.h"
-#include "CMarksMeter.h"
 #include "CMapFits.h"
+#include "CMarksMeter.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
 #include "COrrinStream.h"
@@ -305,7 +305,7 @@ private:
     CBoneMapProfile* m_pkProfile = nullptr; ///< the editor's
     MotionMarks m_kMarks;                   ///< of the result, once they are measured
     CMarksMeter m_kMarksMeter;
-    CFailureRecord m_kWriteRecord;          ///< failures of the last WriteResult
+    CFailureRecord m_kWriteRecord; ///< failures of the last WriteResult
 };
 
 } // namespace gw

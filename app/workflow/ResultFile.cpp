@@ -25,11 +25,12 @@ CByteSink Watched(CByteSink sink, const SaveProgress& progress)
 {
     if (!progress)
         return sink;
-    return [sink = std::move(sink), &progress, written = size_t{0}](std::span<const std::byte> bytes) mutable {
-        written += bytes.size();
-        progress(written);
-        return sink(bytes);
-    };
+    return
+        [sink = std::move(sink), &progress, written = size_t{0}](std::span<const std::byte> bytes) mutable {
+            written += bytes.size();
+            progress(written);
+            return sink(bytes);
+        };
 }
 
 // Saves the result with rate / profileRate times as many frames.

@@ -99,8 +99,7 @@ private:
     void FocusView();
     void FocusNext();
     void RunSoon(ERemedy remedy);
-    EAnswer AskWithOffers(QWidget* asker, const std::string& text, EButtons buttons,
-                          const BoxExtras& extras);
+    EAnswer AskWithOffers(QWidget* asker, const std::string& text, EButtons buttons, const BoxExtras& extras);
     std::string Notes() const;
 
     const CLeftKeys& keys_;

@@ -99,7 +99,7 @@ public:
     bool m_bProgressDue = false;
     bool m_bCancel = false;
     bool m_bShowsFindings = false;
-    FileDialogSetup m_kAsked; ///< of the last file or folder dialog
+    FileDialogSetup m_kAsked;                    ///< of the last file or folder dialog
     std::map<std::string, std::string> m_kTexts; ///< last texts of children, by name
 };
 
