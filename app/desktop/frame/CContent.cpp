@@ -41,7 +41,7 @@ CContent::CContent(const CSkin& skin, const CLeftKeys& keys, QWidget* frame) : Q
     {
         QWidget* const widget = MakeFaceChild(child, skin, keys, this);
         m_kChildren[child.name] = widget;
-        Connect(widget);
+        Connect(*widget);
     }
     ConnectMarks();
     ShowNoteCount();
@@ -58,16 +58,16 @@ Widget* CContent::Child(std::string_view name) const
     return found == m_kChildren.end() ? nullptr : dynamic_cast<Widget*>(found->second);
 }
 
-void CContent::Connect(QWidget* child)
+void CContent::Connect(QWidget& child)
 {
-    if (auto* button = dynamic_cast<CFaceButton*>(child))
+    if (auto* button = dynamic_cast<CFaceButton*>(&child))
         connect(button, &QPushButton::clicked, this, [this, button] { Click(ToUtf8(button->objectName())); });
-    else if (auto* title = dynamic_cast<CTitleLabel*>(child))
+    else if (auto* title = dynamic_cast<CTitleLabel*>(&child))
         title->mouseDown = [this](const QPoint& position) { titleDown(position); };
-    else if (child->property("kind").toString() == QLatin1String("view"))
-        MakeHint(child);
+    else if (child.property("kind").toString() == QLatin1String("view"))
+        MakeHint(&child);
     else
-        ConnectBar(child);
+        ConnectBar(&child);
 }
 
 void CContent::ConnectBar(QWidget* child)

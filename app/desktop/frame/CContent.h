@@ -88,7 +88,7 @@ protected:
 private:
     template <class Widget>
     Widget* Child(std::string_view name) const;
-    void Connect(QWidget* child);
+    void Connect(QWidget& child);
     void ConnectBar(QWidget* child);
     void ConnectMarks();
     void Click(const std::string& child);
