@@ -37,7 +37,7 @@ FLAT, LIFT, SWING = 0.07, 0.40, 0.62  # parts of a foot's cycle, which begins as
 
 
 def rotation(z, x, y):
-    """The matrix that turns columns about Y, then X, then Z, by degrees, as the channels of the file do."""
+    """Return the matrix of a joint's three rotation channels, in degrees; it multiplies column vectors."""
     (sz, cz), (sx, cx), (sy, cy) = ((math.sin(math.radians(a)), math.cos(math.radians(a))) for a in (z, x, y))
     return ((cz * cy - sz * sx * sy, -sz * cx, cz * sy + sz * sx * cy),
             (sz * cy + cz * sx * sy, cz * cx, sz * sy - cz * sx * cy), (-cx * sy, sx, cx * cy))

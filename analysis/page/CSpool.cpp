@@ -1,14 +1,12 @@
 #include "CSpool.h"
 
 #include "CSafeFile.h"
+#include "Paths.h"
 #include "SystemError.h"
 
 #include <array>
-#include <cerrno>
 #include <cstdlib>
-#include <filesystem>
 #include <string>
-#include <system_error>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -20,12 +18,13 @@ namespace {
 // std::tmpfile ignores TMPDIR.
 std::FILE* OpenNameless()
 {
-    std::error_code error;
-    std::string path = (std::filesystem::temp_directory_path(error) / "gaitwright-XXXXXX").string();
-    const int file = error ? -1 : mkostemp(path.data(), O_CLOEXEC);
+    const std::string folder = TemporaryFolder();
+    std::string path = folder + "gaitwright-XXXXXX";
+    const int file = folder.empty() ? -1 : mkostemp(path.data(), O_CLOEXEC);
     if (file < 0)
     {
-        KeepSystemError(error ? error.value() : errno);
+        if (!folder.empty())
+            KeepSystemError();
         return nullptr;
     }
     unlink(path.c_str());

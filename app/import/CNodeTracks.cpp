@@ -53,20 +53,6 @@ aiQuaterniont<double> RotationAt(const aiQuatKey* keys, unsigned count, double t
     return result.Normalize();
 }
 
-SceneMatrix LocalAt(const aiNodeAnim& channel, const SceneMatrix& fallback, double ticks)
-{
-    aiVector3t<double> scale, position;
-    aiQuaterniont<double> rotation;
-    fallback.Decompose(scale, rotation, position);
-    if (channel.mNumPositionKeys > 0)
-        position = VectorAt(channel.mPositionKeys, channel.mNumPositionKeys, ticks);
-    if (channel.mNumRotationKeys > 0)
-        rotation = RotationAt(channel.mRotationKeys, channel.mNumRotationKeys, ticks);
-    if (channel.mNumScalingKeys > 0)
-        scale = VectorAt(channel.mScalingKeys, channel.mNumScalingKeys, ticks);
-    return SceneMatrix(scale, rotation, position);
-}
-
 } // namespace
 
 CNodeTracks::CNodeTracks(const CSceneNodes& nodes, const aiAnimation* animation)
@@ -78,27 +64,40 @@ CNodeTracks::CNodeTracks(const CSceneNodes& nodes, const aiAnimation* animation)
         const size_t node = nodes.Find(animation->mChannels[i]->mNodeName.C_Str());
         if (node == CSceneNodes::kNone)
             continue;
-        m_kChannels[node] = animation->mChannels[i];
+        Channel& channel = m_kChannels[node];
+        channel.keys = animation->mChannels[i];
+        m_kDefaults[node].Decompose(channel.scale, channel.rotation, channel.position);
         if (nodes[node].joint != CSceneNodes::kNone)
             hasMovedHelper[nodes[node].joint] = true;
     }
     for (size_t i = 0; i < nodes.Count(); ++i)
     {
         const size_t joint = nodes[i].joint;
-        if (joint != CSceneNodes::kNone && m_kChannels[joint] && !hasMovedHelper[joint])
+        if (joint != CSceneNodes::kNone && m_kChannels[joint].keys && !hasMovedHelper[joint])
             m_kDefaults[i] = SceneMatrix();
     }
 }
 
-std::vector<SceneMatrix> CNodeTracks::LocalsAt(double ticks) const
+SceneMatrix CNodeTracks::LocalAt(const Channel& channel, double ticks)
 {
-    std::vector<SceneMatrix> locals(m_kDefaults);
-    for (size_t i = 0; i < locals.size(); ++i)
+    const aiNodeAnim& keys = *channel.keys;
+    return SceneMatrix(
+        keys.mNumScalingKeys > 0 ? VectorAt(keys.mScalingKeys, keys.mNumScalingKeys, ticks) : channel.scale,
+        keys.mNumRotationKeys > 0 ? RotationAt(keys.mRotationKeys, keys.mNumRotationKeys, ticks)
+                                  : channel.rotation,
+        keys.mNumPositionKeys > 0 ? VectorAt(keys.mPositionKeys, keys.mNumPositionKeys, ticks)
+                                  : channel.position);
+}
+
+void CNodeTracks::PoseAt(double ticks, std::vector<SceneMatrix>& worlds) const
+{
+    worlds.resize(nodes_.Count());
+    for (size_t i = 0; i < worlds.size(); ++i)
     {
-        if (m_kChannels[i])
-            locals[i] = LocalAt(*m_kChannels[i], m_kDefaults[i], ticks);
+        const SceneMatrix local = m_kChannels[i].keys ? LocalAt(m_kChannels[i], ticks) : m_kDefaults[i];
+        const size_t parent = nodes_[i].parent;
+        worlds[i] = parent == CSceneNodes::kNone ? local : worlds[parent] * local;
     }
-    return locals;
 }
 
 } // namespace gw

@@ -21,7 +21,7 @@ using Vector = aiVector3t<double>;
 using Rotation = aiMatrix3x3t<double>;
 
 constexpr double kDefaultRate = 30.0;
-constexpr double kNotMoved = 3e-6; // of the skeleton's size: noise of the file's single precision
+constexpr double kNoise = 3e-5; // of the longest bone: what single precision in the file amounts to
 
 struct Placement
 {
@@ -168,32 +168,27 @@ double RateOfFile(const CSceneNodes& nodes, const aiAnimation& clip)
     return RateOfKeys(clip, TicksPerSecond(clip));
 }
 
-float Size(const ImportedMotion& motion)
-{
-    double sum = 0.0;
-    for (size_t i = 1; i < motion.joints.size(); ++i)
-        sum = std::max(sum, Vec3Length(motion.joints[i].offset));
-    return static_cast<float>(sum);
-}
-
 // Joints that only rotate keep exactly their offsets.
 void SettleOffsets(ImportedMotion& motion)
 {
-    const float noise = static_cast<float>(kNotMoved) * 10.0f * Size(motion);
+    double longest = 0.0;
+    for (size_t i = 1; i < motion.joints.size(); ++i)
+        longest = std::max(longest, Vec3Length(motion.joints[i].offset));
     for (size_t i = 1; i < motion.joints.size(); ++i)
     {
         ImportedJoint& joint = motion.joints[i];
-        const auto isSettled = [&](const Vec3& p) { return Vec3Length(p - joint.offset) <= noise; };
+        const auto isSettled = [&](const Vec3& p) {
+            return Vec3Length(p - joint.offset) <= kNoise * longest;
+        };
         if (std::ranges::all_of(joint.positions, isSettled))
             std::ranges::fill(joint.positions, joint.offset);
     }
 }
 
-} // namespace
-
-// At the moment of binding, a skin is in place: a bone's matrix is that of its mesh times the inverse of the
-// bone's offset. But glTF ignores the mesh's own matrix, and files differ in whether they mean it. The
-// reading that is closer to the nodes' places is the right one.
+// Returns the world matrices of all nodes in the rest pose: where the skins were bound to their bones, and
+// elsewhere as the nodes are placed in the file. At the moment of binding, a skin is in place: a bone's
+// matrix is that of its mesh times the inverse of the bone's offset. But glTF ignores the mesh's own matrix,
+// and files differ in whether they mean it. The reading that is closer to the nodes' places is the right one.
 std::vector<SceneMatrix> RestWorlds(const CSceneNodes& nodes)
 {
     std::vector<SceneMatrix> locals = nodes.DefaultLocals();
@@ -215,6 +210,42 @@ std::vector<SceneMatrix> RestWorlds(const CSceneNodes& nodes)
     return rest;
 }
 
+// Adds the skeleton's joints without keys, and returns where they are at rest.
+std::vector<Placement> AddJoints(const CSceneNodes& nodes, const SceneSkeleton& skeleton,
+                                 const SceneMatrix& upright, ImportedMotion& motion)
+{
+    const std::vector<SceneMatrix> worlds = RestWorlds(nodes);
+    std::vector<Placement> rest;
+    for (size_t j = 0; j < skeleton.nodes.size(); ++j)
+    {
+        rest.push_back(PlacementOf(upright * worlds[skeleton.nodes[j]]));
+        const int parent = skeleton.parents[j];
+        const Vector from = parent < 0 ? Vector() : rest[static_cast<size_t>(parent)].position;
+        ImportedJoint& joint = motion.joints.emplace_back();
+        joint.name = nodes[skeleton.nodes[j]].name;
+        joint.parent = parent;
+        joint.offset = Narrow(rest[j].position - from);
+        joint.positions.reserve(motion.frameCount);
+        joint.rotations.reserve(motion.frameCount);
+    }
+    return rest;
+}
+
+// Adds a key to each joint. A joint's own rotation is relative to its rest pose.
+void AddKeys(const std::vector<Placement>& places, ImportedMotion& motion)
+{
+    for (size_t j = 0; j < places.size(); ++j)
+    {
+        ImportedJoint& joint = motion.joints[j];
+        const Placement above = joint.parent < 0 ? Placement() : places[static_cast<size_t>(joint.parent)];
+        const Rotation toParent = Transposed(above.rotation);
+        joint.positions.push_back(Narrow(toParent * (places[j].position - above.position)));
+        joint.rotations.push_back(Narrow(toParent * places[j].rotation));
+    }
+}
+
+} // namespace
+
 SceneClip PlanClip(const CSceneNodes& nodes, const aiAnimation* animation, double rate)
 {
     SceneClip clip{animation, rate > 0.0 ? rate : kDefaultRate};
@@ -233,35 +264,21 @@ void SampleJoints(const CSceneNodes& nodes, const SceneSkeleton& skeleton, const
                   const SceneMatrix& upright, ImportedMotion& motion)
 {
     const CNodeTracks tracks(nodes, clip.animation);
-    const std::vector<SceneMatrix> restWorlds = RestWorlds(nodes);
-    std::vector<Placement> rest;
-    for (size_t j = 0; j < skeleton.nodes.size(); ++j)
-    {
-        rest.push_back(PlacementOf(upright * restWorlds[skeleton.nodes[j]]));
-        const int parent = skeleton.parents[j];
-        const Vector from = parent < 0 ? Vector() : rest[static_cast<size_t>(parent)].position;
-        ImportedJoint& joint = motion.joints.emplace_back();
-        joint.name = nodes[skeleton.nodes[j]].name;
-        joint.parent = parent;
-        joint.offset = Narrow(rest[j].position - from);
-        joint.positions.reserve(motion.frameCount);
-        joint.rotations.reserve(motion.frameCount);
-    }
+    std::vector<Rotation> fromRest;
+    for (const Placement& rest : AddJoints(nodes, skeleton, upright, motion))
+        fromRest.push_back(Transposed(rest.rotation));
     const double ticksPerFrame = clip.animation ? TicksPerSecond(*clip.animation) / clip.rate : 0.0;
-    std::vector<Placement> now(rest.size());
+    std::vector<SceneMatrix> worlds;
+    std::vector<Placement> places(fromRest.size());
     for (uint32_t frame = 0; frame < motion.frameCount; ++frame)
     {
-        const std::vector<SceneMatrix> worlds = nodes.WorldOf(tracks.LocalsAt(frame * ticksPerFrame));
-        for (size_t j = 0; j < now.size(); ++j)
+        tracks.PoseAt(frame * ticksPerFrame, worlds);
+        for (size_t j = 0; j < places.size(); ++j)
         {
-            now[j] = PlacementOf(upright * worlds[skeleton.nodes[j]]);
-            now[j].rotation = now[j].rotation * Transposed(rest[j].rotation);
-            const int parent = skeleton.parents[j];
-            const Placement above = parent < 0 ? Placement() : now[static_cast<size_t>(parent)];
-            const Rotation toParent = Transposed(above.rotation);
-            motion.joints[j].positions.push_back(Narrow(toParent * (now[j].position - above.position)));
-            motion.joints[j].rotations.push_back(Narrow(toParent * now[j].rotation));
+            places[j] = PlacementOf(upright * worlds[skeleton.nodes[j]]);
+            places[j].rotation = places[j].rotation * fromRest[j];
         }
+        AddKeys(places, motion);
     }
     SettleOffsets(motion);
 }

@@ -3,8 +3,6 @@
 #include "CSceneNodes.h"
 #include "SceneSkeleton.h"
 
-#include <vector>
-
 namespace gw {
 
 struct ImportedMotion;
@@ -17,10 +15,6 @@ struct SceneClip
     bool isRateOfFile = false;
     double frames = 1.0; ///< number of frames, a whole number
 };
-
-/// Returns the world matrices of all nodes in the rest pose: where the skins were bound to their bones, and
-/// elsewhere as the nodes are placed in the file.
-std::vector<SceneMatrix> RestWorlds(const CSceneNodes& nodes);
 
 /// Plans the sampling of a clip. `rate` is used if the file has none; 0 for 30.
 SceneClip PlanClip(const CSceneNodes& nodes, const aiAnimation* animation, double rate);

@@ -6,9 +6,10 @@
 
 #include "SceneSkeleton.h"
 
+#include "Text.h"
+
 #include <algorithm>
 #include <array>
-#include <cctype>
 #include <string>
 
 namespace gw {
@@ -24,8 +25,7 @@ constexpr std::array<std::string_view, 6> kHolders = {"armature", "rootnode", "s
 
 bool IsHolder(const std::string& name)
 {
-    std::string lower = name;
-    std::ranges::transform(lower, lower.begin(), [](unsigned char c) { return std::tolower(c); });
+    const std::string lower = LowerCase(name);
     return lower.empty() ||
            std::ranges::any_of(kHolders, [&](std::string_view holder) { return lower.starts_with(holder); });
 }

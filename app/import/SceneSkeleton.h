@@ -10,7 +10,7 @@ namespace gw {
 /// A skeleton found among the nodes of a scene.
 struct SceneSkeleton
 {
-    std::vector<size_t> nodes; ///< index of each joint's node, parents first; empty if there is no skeleton
+    std::vector<size_t> nodes; ///< index of each joint's node, parents first; empty if no skeleton was found
     std::vector<int> parents;  ///< index of each joint's parent among the joints; -1 for the first
 };
 

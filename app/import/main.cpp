@@ -5,15 +5,16 @@
 
 #include "CSceneNodes.h"
 #include "ImportedMotion.h"
+#include "Paths.h"
 #include "Sandbox.h"
 #include "ScenePoses.h"
 #include "SceneSkeleton.h"
+#include "Text.h"
 
 #include <assimp/Importer.hpp>
 #include <assimp/config.h>
 
 #include <algorithm>
-#include <cctype>
 #include <cstdio>
 #include <cstdlib>
 #include <new>
@@ -52,18 +53,12 @@ Order ReadArguments(int count, char** arguments)
     return order;
 }
 
-bool EqualNoCase(std::string_view a, std::string_view b)
-{
-    const auto lower = [](unsigned char c) { return std::tolower(c); };
-    return std::ranges::equal(a, b, {}, lower, lower);
-}
-
 std::string ClipName(const aiAnimation& clip, unsigned index)
 {
     return clip.mName.length > 0 ? clip.mName.C_Str() : "clip " + std::to_string(index + 1);
 }
 
-// Returns the requested clip, or the longest; null if there is none.
+// Returns the requested clip, or the longest; null if the file does not have it.
 const aiAnimation* ChooseClip(const aiScene& scene, const Order& order, ImportedMotion& motion)
 {
     const aiAnimation* chosen = nullptr;
@@ -91,12 +86,12 @@ T Fact(const aiScene& scene, const char* name, T fallback)
     return scene.mMetaData && scene.mMetaData->Get(name, value) ? value : fallback;
 }
 
-double UnitMeters(const aiScene& scene, std::string_view extension)
+double UnitMeters(const aiScene& scene, const std::string& path)
 {
     constexpr double kCentimeter = 0.01;
     if (scene.mMetaData && scene.mMetaData->HasKey("UnitScaleFactor"))
         return kCentimeter * Fact(scene, "UnitScaleFactor", 1.0);
-    return extension == ".dae" ? 0.0 : 1.0; // glTF is in meters
+    return HasExtension(path, ".dae") ? 0.0 : 1.0; // glTF is in meters
 }
 
 // The rotation that turns the file's up axis to Y, if the library has not applied it to the root itself.
@@ -114,14 +109,6 @@ SceneMatrix Upright(const aiScene& scene, bool& turns)
     if (axis == 0)
         return SceneMatrix::RotationZ(sign < 0 ? -kQuarter : kQuarter, matrix);
     return SceneMatrix::RotationX(2.0 * kQuarter, matrix);
-}
-
-std::string ExtensionOf(const std::string& path)
-{
-    const size_t dot = path.rfind('.');
-    std::string extension = dot == path.npos ? std::string() : path.substr(dot);
-    std::ranges::transform(extension, extension.begin(), [](unsigned char c) { return std::tolower(c); });
-    return extension;
 }
 
 void Refuse(ImportedMotion& motion, EImport outcome, std::string words = {})
@@ -144,7 +131,7 @@ void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
         return Refuse(motion, EImport::TooLarge);
     motion.rate = clip.rate;
     motion.isRateOfFile = clip.isRateOfFile;
-    motion.unitMeters = UnitMeters(scene, ExtensionOf(order.path));
+    motion.unitMeters = UnitMeters(scene, order.path);
     motion.frameCount = static_cast<uint32_t>(clip.frames);
     const SceneMatrix upright = Upright(scene, motion.wasTurnedUp);
     SampleJoints(nodes, skeleton, clip, upright, motion);

@@ -98,9 +98,7 @@ bool CDraftShelf::OpenFolder()
 {
     if (!m_kFolder.empty())
         return CreateFolder(m_kFolder);
-    std::error_code error;
-    std::string path =
-        WithSeparator(std::filesystem::temp_directory_path(error).string()) + "gaitwright-drafts-XXXXXX";
+    std::string path = TemporaryFolder() + "gaitwright-drafts-XXXXXX";
     if (mkdtemp(path.data()))
         m_kFolder = WithSeparator(path);
     else

@@ -32,8 +32,8 @@ public:
     /// draft of another skeleton, later jobs that need one wait for it. Can be called in any process.
     void Settle(size_t job);
     void SettleCurrent() { Settle(m_uiJob); }
-    /// Returns the draft for the current job's skeleton; waits until no earlier job can provide it. Empty if
-    /// there is none: then the job must draft it, and keep the draft or settle.
+    /// Returns the draft for the current job's skeleton; waits until no earlier job can provide it. If
+    /// the result is empty, the job must make the draft, and keep it or settle.
     std::string Find(std::string_view skeleton);
     /// Writes a draft, settles the current job, and returns the draft's path. `stem` begins the file's name.
     /// If it cannot be written, returns an empty path; see TakeSystemError.
@@ -51,7 +51,7 @@ private:
     int m_iOwner; ///< the process that created a temporary folder
     size_t m_uiJobCount;
     size_t m_uiJob = 0;
-    State* m_pkStates = nullptr; ///< one per job, in memory that all workers share; null if there is none
+    State* m_pkStates = nullptr; ///< one per job, in memory that all workers share; may be null
 };
 
 } // namespace gw

@@ -143,7 +143,7 @@ public:
     Hint ResultHint() const;
     /// Returns the remedies for the notices of a step.
     std::vector<Offer> OffersFor(std::span<const Notice> notices) const;
-    /// Returns the first lines of the first error among the notices of a step; empty if there is none.
+    /// Returns the first lines of the first error among the notices of a step; empty without an error.
     std::string SummaryOf(std::span<const Notice> notices) const;
 
     // Help

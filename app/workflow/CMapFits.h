@@ -21,7 +21,7 @@ public:
     void Measure(std::span<const std::string> folders, CNode& source, CNode& target);
 
     /// Returns the best map of which every row matches, possibly doubtful or adapted to the source's name
-    /// prefix; null if there is none.
+    /// prefix; null if no map fits.
     const ProfileChoice* Best() const;
     /// Returns how a map fits as it is installed; null for a name that is not.
     const ProfileChoice* Find(std::string_view name) const;

@@ -23,7 +23,7 @@ bool IsAbout(double value, double other)
     return std::fabs(value / other - 1.0) <= kSameSpeed;
 }
 
-// Returns how fast a motion plays compared with its own rate; empty if there is no visible difference.
+// Returns how fast a motion plays compared with its own rate; empty if nobody would see the difference.
 std::string SpeedWords(double speed)
 {
     if (IsAbout(speed, 1.0))

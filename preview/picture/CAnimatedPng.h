@@ -8,7 +8,7 @@ namespace gw {
 
 /// An animated PNG, made of the encoded pictures of its frames. A program that does not know animations shows
 /// the first one.
-/// https://wiki.mozilla.org/APNG_Specification, now part of the third edition of PNG
+/// The format is APNG, which the third edition of PNG includes.
 class CAnimatedPng
 {
 public:

@@ -84,6 +84,12 @@ bool CPrivateFile::Create(const std::string& folder, std::string_view extension,
     return false;
 }
 
+bool CPrivateFile::CreateTemporary(std::string_view extension)
+{
+    const std::string folder = TemporaryFolder();
+    return !folder.empty() && Create(folder, extension, S_IRUSR | S_IWUSR);
+}
+
 bool CPrivateFile::Write(std::string_view text)
 {
     return m_iFile >= 0 && ftruncate(m_iFile, 0) == 0 && WriteAllAt(m_iFile, text, 0);

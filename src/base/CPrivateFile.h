@@ -23,6 +23,8 @@ public:
     /// Replaces the file by a new, empty one in a folder that ends in a separator, with an extension (dot
     /// included) and a mode (minus the user's umask). Returns false if the file cannot be created.
     bool Create(const std::string& folder, std::string_view extension, unsigned mode);
+    /// Same in the folder for temporary files, readable only by the user.
+    bool CreateTemporary(std::string_view extension);
     /// Replaces the content; false if it cannot be written.
     bool Write(std::string_view text);
     /// Closes and deletes the file.

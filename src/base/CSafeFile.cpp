@@ -178,7 +178,7 @@ bool CSafeFile::Commit()
 {
     if (m_kPrivate.File() < 0)
         return false;
-    errno = 0; // a gate that stays closed is no failure of the system
+    errno = 0; // a commit that the run refuses has no system error
     const bool isWritten = !m_bFailed;
     const bool good = isWritten && KeepOwnership() && Sync() && Rename();
     if (isWritten && !good)

@@ -117,7 +117,7 @@ struct Finding
     ESeverity severity = ESeverity::Error;
     bool mendable = false; ///< can be fixed in a repaired copy
     size_t more = 0;       ///< further findings like this one, which are only counted
-    int systemError = 0;   ///< errno of the system call that failed; 0 if there is none
+    int systemError = 0;   ///< errno of the system call that failed, or 0
 
     explicit operator bool() const { return reason != EFailure::None; }
 };

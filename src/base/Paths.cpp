@@ -160,6 +160,15 @@ std::string PathFrom(const std::string& folder, const std::string& relative)
     return TextOf((NativePath(folder) / NativePath(relative)).lexically_normal());
 }
 
+std::string TemporaryFolder()
+{
+    std::error_code error;
+    const fs::path folder = fs::temp_directory_path(error);
+    if (error)
+        KeepSystemError(error.value());
+    return error ? std::string() : WithSeparator(TextOf(folder));
+}
+
 std::string ExecutableFolder()
 {
     std::error_code error;

@@ -52,6 +52,8 @@ std::vector<std::string> FilesInFolder(const std::string& folder, std::string_vi
 
 /// Resolves a relative path, with its "..", against a folder that contains no links.
 std::string PathFrom(const std::string& folder, const std::string& relative);
+/// Returns the system's folder for temporary files with a trailing separator; empty if it does not exist.
+std::string TemporaryFolder();
 /// Returns the folder of the running program with a trailing separator, after following links to the program.
 std::string ExecutableFolder();
 

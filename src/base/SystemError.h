@@ -5,7 +5,8 @@
 namespace gw {
 
 // The system's reason for the last failed call on a file. Unlike errno, it survives the clean-up after the
-// failure. Code that calls the system keeps the reason; whoever records or reports the failure takes it.
+// failure. Code that calls the system keeps the reason, and code that records or reports the failure takes
+// it.
 
 /// Keeps a code of errno until it is taken. Without an argument, keeps errno itself.
 void KeepSystemError();

@@ -8,8 +8,6 @@
 #include "Paths.h"
 
 #include <algorithm>
-#include <filesystem>
-#include <system_error>
 
 #include <unistd.h>
 
@@ -21,8 +19,7 @@ constexpr size_t kFileLimit = 0xffff; // index + 1 must fit into 16 bits
 
 std::string DefaultFolder()
 {
-    std::error_code error;
-    return WithSeparator(std::filesystem::temp_directory_path(error).string()) + "TKTmp" + kPathSeparator;
+    return TemporaryFolder() + "TKTmp" + kPathSeparator;
 }
 
 uint32_t HandleOf(size_t file, uint32_t block)

@@ -23,7 +23,7 @@ void ClickItem(QAbstractItemView& view, const QModelIndex& item, Qt::KeyboardMod
 QModelIndex ItemOf(const QAbstractItemView& view, const std::string& text);
 /// Replaces the text of a field with the keyboard.
 void TypeInto(QLineEdit& field, const QString& text);
-/// Enters a path in a file dialog and accepts; returns false if the dialog is no file dialog.
+/// Enters a path in a file dialog and accepts it. Returns false for any other dialog.
 bool ChooseFile(QWidget& dialog, const std::string& path);
 /// Drags a file over a widget and drops it on another one; returns false if the first one does not take it.
 bool DropFile(QWidget& over, QWidget& onto, const std::string& path);

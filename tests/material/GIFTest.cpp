@@ -237,7 +237,7 @@ TEST(CGIFReader, RefusesDamage)
         {"fewer pixels than its size", head + Image(2, 2, 0, 2, codes), false},
         // Three bits per code: clear, a pixel and an undefined code; clear and a code that is not a pixel.
         {"a code of later", head + Image(2, 1, 0, 2, std::string("\xdc\x01", 2)), false},
-        {"a first code that is no pixel", head + Image(2, 1, 0, 2, std::string("\x34\0", 2)), false},
+        {"a first code that is not a color", head + Image(2, 1, 0, 2, std::string("\x34\0", 2)), false},
     };
     for (const auto& [what, file, read] : rows)
     {

@@ -141,7 +141,7 @@ TEST(TKHTRStream, RefusesWithReasonAndLine)
         {"endless scale factor", "1.000000", "inf", "BadNumber 13 inf"},
         {"word in the base pose", "Head 0 50", "Head 0 high", "BadNumber 21 high"},
         {"word in a row", "2 4 5 6", "2 4 x 6", "BadNumber 26 x"},
-        {"row that is no row", "2 4 5 6", "Torso 4 5 6", "BadNumber 26 Torso"},
+        {"row of words", "2 4 5 6", "Torso 4 5 6", "BadNumber 26 Torso"},
     };
     ExpectRefused(kSmallHTR, "a.htr", rows);
 }

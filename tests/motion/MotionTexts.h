@@ -48,7 +48,7 @@ struct Change
 };
 
 std::string Changed(std::string_view text, const Change& change);
-/// Every change leaves the motion as it is and is no matter for the record.
+/// Expects that no change affects the motion or the record.
 void ExpectSame(std::string_view text, const char* fileName, std::span<const Change> rows);
 void ExpectRead(std::string_view text, const char* fileName, std::span<const Change> rows);
 void ExpectRefused(std::string_view text, const char* fileName, std::span<const Change> rows);

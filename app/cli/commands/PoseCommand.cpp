@@ -68,7 +68,7 @@ void WriteObjects(const ShellOptions& options, CJsonWriter& json, CSceneFile& fi
 // A container can claim any end without holding a key for it.
 constexpr size_t kAnyFrameCount = size_t{1} << 20;
 
-// Returns the number of frames; 0, after printing the reason, if there are none, or more than any motion has.
+// Returns the number of frames; 0, after printing the reason, for a file without frames or with too many.
 size_t FramesOf(const std::string& path, CSceneFile& file)
 {
     const CKeyframeControl* track = file.FirstTrack();

@@ -18,7 +18,7 @@ void SayPlain(std::string_view words);
 void SayWarning(const ShellOptions& options, std::string_view words);
 /// Prints an error about a file. `code` is fixed and for programs: "no-folder".
 void SayError(const std::string& path, const char* code, const std::string& words);
-/// Returns the first error that this process has printed; without words if there is none.
+/// Returns the first error that this process has printed; its words are empty before that.
 const Notice& FirstError();
 /// Same for an invalid command line. Always returns false, so that a check can return the result.
 bool Refuse(std::string_view words);

@@ -4,10 +4,6 @@
 #include "FindingWords.h"
 #include "Paths.h"
 
-#include <filesystem>
-
-#include <sys/stat.h>
-
 namespace gw {
 
 namespace {
@@ -42,9 +38,7 @@ bool CMendedSource::Mend(const std::string& path)
 // In the folder for temporary files: nothing else may appear next to the user's motions.
 bool CMendedSource::WriteCopy(CFileExam& exam)
 {
-    std::error_code error;
-    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    return !error && m_kCopy.Create(folder, ".bvh", S_IRUSR | S_IWUSR) &&
+    return m_kCopy.CreateTemporary(".bvh") &&
            exam.WriteMended([&](std::string_view text) { return WriteAll(m_kCopy.File(), text); });
 }
 

@@ -14,7 +14,6 @@
 #include <cerrno>
 #include <cstdio>
 #include <cstdlib>
-#include <filesystem>
 
 #include <fcntl.h>
 #include <unistd.h>
@@ -51,19 +50,23 @@ bool COutputFile::Open(const std::string& path, std::string_view extension)
         return true;
     if (IsStandardOutput(path) && isatty(STDOUT_FILENO) != 0 && !IsForTerminal(extension))
         return Fail("a terminal cannot show this format; redirect standard output to a file or a program");
-    return Create(extension) || Fail("a temporary file cannot be written" + SystemErrorWords(errno));
+    return Create(extension) || Fail("a temporary file cannot be written" + TakeSystemErrorWords());
 }
 
 // Writers replace the file by another one of that name, which no lock protects. So the name is not a private
 // one, which other programs sweep.
 bool COutputFile::Create(std::string_view extension)
 {
-    std::error_code error;
-    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
+    const std::string folder = TemporaryFolder();
     std::string path = folder + "gaitwright-XXXXXX" + std::string(extension);
-    const int file = error ? -1 : mkostemps(path.data(), static_cast<int>(extension.size()), O_CLOEXEC);
+    const int file =
+        folder.empty() ? -1 : mkostemps(path.data(), static_cast<int>(extension.size()), O_CLOEXEC);
     if (file < 0)
+    {
+        if (!folder.empty())
+            KeepSystemError();
         return false;
+    }
     close(file);
     m_kCopy = path;
     m_iLiveName = AddLiveName(m_kCopy);

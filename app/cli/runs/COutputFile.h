@@ -39,7 +39,7 @@ private:
     bool Fail(const std::string& words);
 
     std::string m_kPath;
-    std::string m_kCopy; ///< the temporary file; empty if there is none
+    std::string m_kCopy; ///< the temporary file; empty if the named file is written
     int m_iLiveName = -1;
     Notice m_kFailure;
 };

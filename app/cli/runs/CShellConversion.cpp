@@ -307,7 +307,7 @@ bool CShellConversion::UseDraft()
     return m_bDrafted;
 }
 
-// Adds why there is no draft, or how to get one.
+// Adds the reason why no draft was used, or the option that allows one.
 void CShellConversion::NotifyWithDraft(Notice notice) const
 {
     const std::string source = ShellWord(SourcePath());

@@ -16,10 +16,8 @@
 
 #include <algorithm>
 #include <cerrno>
-#include <filesystem>
 
 #include <fcntl.h>
-#include <sys/stat.h>
 #include <unistd.h>
 
 namespace gw {
@@ -100,15 +98,8 @@ bool CSourceFile::Fail(const std::string& path, const char* code, const std::str
 bool CSourceFile::FailToCopy(const std::string& path)
 {
     return Fail(path, "no-temporary-file",
-                "a temporary file cannot be written" + SystemErrorWords(errno) +
+                "a temporary file cannot be written" + TakeSystemErrorWords() +
                     " (TMPDIR can name another folder)");
-}
-
-bool CSourceFile::Create(std::string_view extension)
-{
-    std::error_code error;
-    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    return !error && m_kCopy.Create(folder, extension, S_IRUSR | S_IWUSR);
 }
 
 bool CSourceFile::CopyStream(const std::string& path)
@@ -123,7 +114,7 @@ bool CSourceFile::CopyStream(const std::string& path)
     if (extension.empty())
         return Fail(path, "unknown-format",
                     "a pipe or device whose first bytes are not those of a motion file");
-    if (!Create(extension) || !CopyRest(stream.File(), start, path))
+    if (!m_kCopy.CreateTemporary(extension) || !CopyRest(stream.File(), start, path))
         return !m_kFailure.words.empty() ? false : FailToCopy(path);
     m_kPath = m_kCopy.Path();
     return true;
@@ -171,7 +162,7 @@ bool CSourceFile::Unpack(const std::string& path)
 bool CSourceFile::CopyBytes(const std::string& path, std::span<const std::byte> bytes,
                             std::string_view extension)
 {
-    if (!Create(extension) ||
+    if (!m_kCopy.CreateTemporary(extension) ||
         !WriteAll(m_kCopy.File(), {reinterpret_cast<const char*>(bytes.data()), bytes.size()}))
         return FailToCopy(path);
     m_kPath = m_kCopy.Path();

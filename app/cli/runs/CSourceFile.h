@@ -35,7 +35,6 @@ private:
     bool CopyStream(const std::string& path);
     bool CopyRest(int file, std::string& start, const std::string& path);
     bool Unpack(const std::string& path);
-    bool Create(std::string_view extension);
     bool CopyBytes(const std::string& path, std::span<const std::byte> bytes, std::string_view extension);
     bool FailToCopy(const std::string& path);
     bool Fail(const std::string& path, const char* code, const std::string& words);

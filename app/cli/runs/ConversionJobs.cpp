@@ -92,9 +92,8 @@ EExit ListConversions(const ShellOptions& options, CFileRun::Jobs& jobs)
         return EExit::Usage;
     if (!jobs.empty())
         return EExit::Done;
-    SayError(
-        {}, "no-sources",
-        "there are no motion files to convert (.bvh, .orn, .htr, .cha, .chb, .fbx, .gltf, .glb, .vrm, .dae)");
+    SayError({}, "no-sources",
+             "no motion files found (.bvh, .orn, .htr, .cha, .chb, .fbx, .gltf, .glb, .vrm, .dae)");
     return EExit::Failed;
 }
 

@@ -16,30 +16,21 @@
 #include "Words.h"
 
 #include <cmath>
-#include <filesystem>
 
 namespace gw {
 
 namespace {
 
-Notice NoTemporary(const std::string& folder)
-{
-    return MakeNotice(folder, "no-temporary-file",
-                      "a temporary file cannot be written here" + TakeSystemErrorWords() +
-                          " (TMPDIR can name another folder)");
-}
-
 // Streams read only files, so the bytes inside a package are written to a temporary file first.
 std::optional<Notice> WhyNotLoaded(const std::string& path, std::span<const std::byte> bytes,
                                    const char* extension, CMotionFile& motion)
 {
-    std::error_code error;
-    const std::string folder = WithSeparator(std::filesystem::temp_directory_path(error).string());
-    if (error)
-        return NoTemporary("TMPDIR");
-    CPrivateFile inner(folder, extension);
-    if (!inner.Write(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size())))
-        return NoTemporary(folder);
+    CPrivateFile inner;
+    if (!inner.CreateTemporary(extension) ||
+        !inner.Write(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size())))
+        return MakeNotice(path, "no-temporary-file",
+                          "a temporary file cannot be written" + TakeSystemErrorWords() +
+                              " (TMPDIR can name another folder)");
     if (motion.Load(inner.Path()))
         return std::nullopt;
     return MakeNotice(path, motion.Record().Failure());

@@ -176,7 +176,7 @@ bool CProfileEditorWindow::AcceptSearch()
     return true;
 }
 
-// Returns false if there is no search to clear.
+// Returns whether a search was cleared.
 bool CProfileEditorWindow::ClearSearch()
 {
     bool cleared = false;

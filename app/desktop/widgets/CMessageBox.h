@@ -24,7 +24,7 @@ struct BoxExtras
 {
     std::string summary;             ///< shown below the text
     std::vector<std::string> offers; ///< buttons next to the answers; they close the box like the last answer
-    std::string details;             ///< unfold below; empty if there are none
+    std::string details;             ///< text to unfold; may be empty
     EDetails shown = EDetails::Folded;
 };
 

@@ -29,7 +29,7 @@ private:
     void DrawGlyph(RgbPicture& picture, int left, int baseline, LineColor color) const;
 
     FT_LibraryRec_* m_pkLibrary = nullptr;
-    FT_FaceRec_* m_pkFace = nullptr; ///< null if there is no font
+    FT_FaceRec_* m_pkFace = nullptr; ///< null without a font
 };
 
 } // namespace gw

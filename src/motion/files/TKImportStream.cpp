@@ -66,14 +66,14 @@ std::vector<std::vector<size_t>> ChildrenOf(const std::vector<ImportedJoint>& jo
 }
 
 void AddBoneShape(const std::vector<ImportedJoint>& joints, const std::vector<size_t>& children,
-                  const std::string& name, CNode& node)
+                  const std::string& name, EBoneMeshes meshes, CNode& node)
 {
     if (children.empty())
         return;
     double longest = 0.0;
     for (const size_t child : children)
         longest = std::max(longest, Vec3Length(joints[child].offset));
-    CBoneMesh& mesh = AttachBone(node, name, children.size(), static_cast<float>(longest));
+    CBoneMesh& mesh = AttachBone(node, name, children.size(), static_cast<float>(longest), meshes);
     if (children.size() == 1)
         mesh.m_kMatrix = Mat4Compose(BoneTurn(joints[children[0]].offset), kVec3Zero);
 }
@@ -170,7 +170,7 @@ void TKImportStream::BuildAnimatedTree(ImportedMotion& motion)
         track.m_kRotationKeys = std::move(joint.rotations);
         track.m_kPositionKeys = std::move(joint.positions);
         track.m_kScaleKeys.assign(motion.frameCount, kVec3One);
-        AddBoneShape(motion.joints, children[i], joint.name, node);
+        AddBoneShape(motion.joints, children[i], joint.name, boneMeshes, node);
     }
 }
 
