@@ -174,7 +174,11 @@ std::string ExecutableFolder()
     std::error_code error;
     fs::path program = fs::read_symlink("/proc/self/exe", error);
     if (error) // a root file system without /proc, such as a package build's
-        program = fs::canonical(reinterpret_cast<const char*>(getauxval(AT_EXECFN)), error);
+    {
+        // NOLINTNEXTLINE(performance-no-int-to-ptr): the system passes this address as a number
+        const auto* const path = reinterpret_cast<const char*>(getauxval(AT_EXECFN));
+        program = fs::canonical(path, error);
+    }
     return SplitPath(TextOf(program)).folder;
 }
 

@@ -159,7 +159,7 @@ TEST(CGIFReader, ReadsLongRuns)
     const Ref<CImage> written = new CImage;
     written->Pixels().Create(700, 100, 0, blue);
     for (int x = 0; x < 700; x += 3)
-        std::memset(CPixelLock(written->Pixels()).Row(x % 100) + 4 * x, 255, 4);
+        std::memset(CPixelLock(written->Pixels()).Row(x % 100) + ptrdiff_t{4} * x, 255, 4);
     ASSERT_TRUE(written->Save(folder.Path("a.gif"), 90));
     GIFImage image;
     ASSERT_TRUE(ReadFirst(ReadBytes(folder.Path("a.gif")), image));
