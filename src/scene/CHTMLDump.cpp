@@ -109,10 +109,15 @@ COrnHTMLWriter CHTMLDump::TreePage(const std::vector<TreeEntry>& entries)
     return page;
 }
 
+bool CHTMLDump::Write(const COrnHTMLPage& page, const std::string& fileName)
+{
+    return page.SaveAs(m_kFolder + fileName);
+}
+
 void CHTMLDump::Save(const COrnHTMLPage& page, const std::string& fileName)
 {
     ++m_uiPages;
-    if (!page.SaveAs(m_kFolder + fileName))
+    if (!Write(page, fileName))
         ++m_uiFailed;
 }
 

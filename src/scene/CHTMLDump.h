@@ -21,6 +21,9 @@ public:
 
     /// File names are appended to `folder`, so it must end with a separator.
     explicit CHTMLDump(std::string folder) : m_kFolder(std::move(folder)) {}
+    virtual ~CHTMLDump() = default;
+    CHTMLDump(const CHTMLDump&) = delete;
+    CHTMLDump& operator=(const CHTMLDump&) = delete;
 
     /// Adds an object's tables to a page. The pages of everything it links to are left to the running dump,
     /// or saved in the folder if no dump is running.
@@ -36,6 +39,10 @@ public:
     size_t EntryCount() const { return m_uiEntries; }
     /// Returns the number of pages that could not be written.
     size_t FailedCount() const { return m_uiFailed; }
+
+protected:
+    /// Writes a finished page into the folder. Returns false if that fails.
+    virtual bool Write(const COrnHTMLPage& page, const std::string& fileName);
 
 private:
     // A node of a tree and its parent entry, null at the root.

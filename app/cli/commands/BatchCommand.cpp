@@ -98,9 +98,9 @@ bool ListJobs(const ShellOptions& options, CFileRun::Jobs& jobs)
     return true;
 }
 
-EExit FailWith(const std::string& words)
+EExit FailWith(const std::string& path, const char* code, const std::string& words)
 {
-    SayError(words);
+    SayError(path, code, words);
     return EExit::Failed;
 }
 
@@ -109,7 +109,7 @@ EExit FailWith(const std::string& words)
 EExit RunBatchFolder(const ShellOptions& options)
 {
     if (!options.files.empty() && !FolderExists(options.files[0]))
-        return FailWith(Printable(options.files[0]) + ": no such folder");
+        return FailWith(options.files[0], "not-found", "no such folder");
     if (!IsRunPossible(options))
         return EExit::Usage;
     if (!options.files.empty() && !CanListFolder(options, options.files[0]))
@@ -120,9 +120,8 @@ EExit RunBatchFolder(const ShellOptions& options)
     if (!AreOutputsApart(jobs))
         return EExit::Usage;
     if (jobs.empty())
-        return FailWith(Printable(options.files.empty() ? options.filesFrom : options.files[0]) +
-                        ": the folder contains no " + std::string(BatchSource(BatchJobOf(options))) +
-                        " file");
+        return FailWith(options.files.empty() ? options.filesFrom : options.files[0], "no-sources",
+                        "the folder contains no " + std::string(BatchSource(BatchJobOf(options))) + " file");
     if (!MakeOutputFolder(options))
         return EExit::Failed;
     return RunBatchJobs(options, jobs);

@@ -75,7 +75,8 @@ MotionClip CComparedSource::Clip()
     return {nodes.front().node, track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
 }
 
-bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vector<BonePair>& pairs)
+bool Pair(const ShellOptions& options, const std::string& profilePath, CNode* source, CNode* result,
+          std::vector<BonePair>& pairs)
 {
     std::vector<MissingBone> missing;
     if (!ReadBonePairs(profilePath, source, result, pairs, missing))
@@ -84,9 +85,14 @@ bool Pair(const std::string& profilePath, CNode* source, CNode* result, std::vec
         return false;
     }
     for (const MissingBone& bone : missing)
-        SayError(Printable(profilePath) + ':' + std::to_string(bone.line) + ": the " +
-                 (bone.side == ESkeletonSide::Source ? "source" : "result") + " has no bone " +
-                 Quoted(bone.name));
+    {
+        Notice notice =
+            MakeNotice(profilePath, "missing-bone",
+                       std::string("the ") + (bone.side == ESkeletonSide::Source ? "source" : "result") +
+                           " has no bone " + Quoted(bone.name));
+        notice.where = static_cast<size_t>(bone.line);
+        SayNotice(options, notice);
+    }
     return missing.empty();
 }
 
@@ -124,7 +130,7 @@ EExit RunCompare(const ShellOptions& options)
     const MotionClip sourceClip = source.Clip();
     const MotionClip resultClip = ClipOf(result);
     std::vector<BonePair> pairs;
-    if (!Pair(profilePath, sourceClip.root, resultClip.root, pairs))
+    if (!Pair(options, profilePath, sourceClip.root, resultClip.root, pairs))
         return EExit::Failed;
     MeasuredConversion measured;
     ConversionDetail* const detail = options.html.empty() ? nullptr : &measured.detail;

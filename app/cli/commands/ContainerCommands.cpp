@@ -9,6 +9,7 @@
 #include "PackagedMotion.h"
 #include "Packaging.h"
 #include "Paths.h"
+#include "Streams.h"
 #include "Text.h"
 #include "Words.h"
 
@@ -60,8 +61,7 @@ EExit RunExtract(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     COrrinStream scene;
-    COutputFile file;
-    if (!file.Open(options, options.output, ".htr") || !LoadContainer(scene, source))
+    if (!LoadContainer(scene, source))
         return EExit::Failed;
     const PackageBlocks blocks = FindPackage(scene);
     if (!blocks.file)
@@ -73,14 +73,18 @@ EExit RunExtract(const ShellOptions& options)
     }
     PackageFacts facts;
     const std::string inside = ReadPackageFacts(*blocks.info, facts) ? FormatExtension(facts.format) : "";
+    const std::string output = InFolder(options.output, source, inside.empty() ? ".htr" : inside);
+    COutputFile file;
+    if (!file.Open(options, output, ".htr"))
+        return EExit::Failed;
     if (!inside.empty() && !HasExtension(file.Path(), inside))
         SayWarning(options, Printable(source) + " contains an " + inside + " file");
     if (!WriteWhole(file.Path(), blocks.file->Data()))
     {
-        SayNotWritten(options.output);
+        SayNotWritten(output);
         return EExit::Failed;
     }
-    return file.DeliverOrSay() ? TellWritten(options, source, options.output) : EExit::Failed;
+    return file.DeliverOrSay() ? TellWritten(options, source, output) : EExit::Failed;
 }
 
 EExit RunPackage(const ShellOptions& options)

@@ -49,10 +49,11 @@ bool ResolveOutput(const ShellOptions& options, std::string& output)
 std::string UsualOutput(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
-    const std::string name = StemOf(source) + std::string(ResultExtension(options));
     if (!options.output.empty())
-        return FolderExists(options.output) ? WithSeparator(options.output) + name : options.output;
-    return source == kStandardStream ? source : SplitPath(source).folder + name;
+        return InFolder(options.output, source, ResultExtension(options));
+    return source == kStandardStream
+               ? source
+               : SplitPath(source).folder + StemOf(source) + std::string(ResultExtension(options));
 }
 
 bool PlanOne(const ShellOptions& options, CFileRun::Jobs& jobs)

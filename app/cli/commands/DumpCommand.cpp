@@ -1,8 +1,10 @@
 #include "CDeferredSync.h"
 #include "CHTMLDump.h"
 #include "COrnHTMLPage.h"
+#include "COutputFile.h"
 #include "CSafeFile.h"
 #include "CSceneFile.h"
+#include "CSinglePageDump.h"
 #include "CommandTable.h"
 #include "Output.h"
 #include "Paths.h"
@@ -31,24 +33,29 @@ bool WriteTreeView(const std::string& folder)
     return script.SaveAs(folder + "TreeView.js");
 }
 
-} // namespace
+bool IsPageNamed(const ShellOptions& options)
+{
+    const std::string& page = options.output;
+    return IsStream(page) || HasExtension(page, ".html") || HasExtension(page, ".htm") ||
+           Refuse(Printable(page) + ": the name of a page must end in .html; --out-dir writes many pages");
+}
 
-EExit RunDump(const ShellOptions& options)
+EExit WriteOnePage(const ShellOptions& options, const std::vector<CObject*>& roots)
+{
+    COutputFile output;
+    if (!output.Open(options, options.output, ".html"))
+        return EExit::Failed;
+    CSinglePageDump dump;
+    for (CObject* root : roots)
+        dump.WriteSite(*root);
+    if (!dump.WriteTo(output.Path()))
+        return Fail(options.output, "the page cannot be written" + TakeSystemErrorWords());
+    return output.DeliverOrSay() ? TellWritten(options, options.files[0], options.output) : EExit::Failed;
+}
+
+EExit WritePages(const ShellOptions& options, const std::vector<CObject*>& roots)
 {
     const std::string& source = options.files[0];
-    if (options.outputFolder == kStandardStream)
-    {
-        SayError(
-            "--out-dir -: a dump has many pages; 'gaitwright info --json' writes the contents as one object");
-        return EExit::Usage;
-    }
-    CSceneFile file;
-    if (!file.LoadWhole(source))
-        return EExit::Failed;
-    SayWarnings(options, source, file.Record());
-    const std::vector<CObject*> roots = file.Roots();
-    if (roots.empty())
-        SayWarning(options, Printable(source) + ": the file has no roots to show");
     const std::string folder = WithSeparator(options.outputFolder);
     if (!CreateFolder(options.outputFolder))
         return Fail(folder, "the folder cannot be created" + TakeSystemErrorWords());
@@ -69,6 +76,25 @@ EExit RunDump(const ShellOptions& options)
         return EExit::Done;
     return Fail(folder, std::to_string(dump.FailedCount()) + " of " + std::to_string(dump.PageCount()) +
                             " pages cannot be written" + TakeSystemErrorWords());
+}
+
+} // namespace
+
+EExit RunDump(const ShellOptions& options)
+{
+    const std::string& source = options.files[0];
+    if (options.outputFolder == kStandardStream)
+        Refuse("--out-dir -: a folder is needed; '-o -' writes one page to standard output");
+    if (options.outputFolder == kStandardStream || (!options.output.empty() && !IsPageNamed(options)))
+        return EExit::Usage;
+    CSceneFile file;
+    if (!file.LoadWhole(source))
+        return EExit::Failed;
+    SayWarnings(options, source, file.Record());
+    const std::vector<CObject*> roots = file.Roots();
+    if (roots.empty())
+        SayWarning(options, Printable(source) + ": the file has no roots to show");
+    return options.output.empty() ? WritePages(options, roots) : WriteOnePage(options, roots);
 }
 
 } // namespace gw

@@ -169,7 +169,7 @@ EExit RunInfo(const ShellOptions& options)
     else
         Print(path, file);
     SayWarnings(options, path, file.Record());
-    if (!file.IsContainer()) // a package stores the rate itself
+    if (!file.IsScene())
         SayRateOfResult(options, path, file.Motion());
     if (!file.IsDamaged())
         return EExit::Done;

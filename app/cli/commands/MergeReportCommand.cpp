@@ -65,8 +65,9 @@ bool ReadReport(const std::string& path, Lines& lines)
     {
         ++number;
         if (!TakeLine(line, lines))
-            SayError(Printable(path) + ':' + std::to_string(number) +
-                     ": this line is nested too deeply for a report and was skipped");
+            SayError({}, "bad-report",
+                     Printable(path) + ':' + std::to_string(number) +
+                         ": this line is nested too deeply for a report and was skipped");
     }
     return true;
 }
@@ -127,8 +128,9 @@ void SayLeft(const CRunPlan& plan, const Lines& lines)
     for (size_t shard = 0; shard < left.size(); ++shard)
     {
         if (left[shard] > 0)
-            SayError("shard " + std::to_string(shard) + ": " + std::to_string(left[shard]) +
-                     " sources are left; run it again");
+            SayError({}, "unfinished",
+                     "shard " + std::to_string(shard) + ": " + std::to_string(left[shard]) +
+                         " sources are left; run it again");
     }
 }
 

@@ -61,7 +61,7 @@ int RunProgram(int argc, char** argv)
     errno = 0;
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {
-        SayError("standard output cannot be written" + SystemErrorWords(errno));
+        SayError({}, "write-error", "standard output cannot be written" + SystemErrorWords(errno));
         exit = EExit::Failed;
     }
     return static_cast<int>(exit);

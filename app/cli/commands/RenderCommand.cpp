@@ -4,6 +4,7 @@
 #include "CJsonWriter.h"
 #include "CSceneFile.h"
 #include "CommandTable.h"
+#include "EditMotion.h"
 #include "JsonStatus.h"
 #include "Output.h"
 #include "PackageBlocks.h"
@@ -66,10 +67,20 @@ bool ShowScene(const std::string& path, CSceneFile& file, PictureMotion& motion)
     return false;
 }
 
+// A result plays at the speed of its source, although its header has the source's rate for more frames.
+PictureMotion Shown(const CMotionFile& file, float rate)
+{
+    const float seconds =
+        rate > 0.0f ? 1.0f / rate : file.GetFrequency() / static_cast<float>(FramesPerSourceFrame(file));
+    SetFrameTime(*file.motionRoot, seconds);
+    return Shown(file.motionRoot.Get(), TimingOf(file));
+}
+
 // The trees outlive their files.
 bool LoadMotion(const ShellOptions& options, const std::string& path, PictureMotion& motion)
 {
     CSceneFile file;
+    file.SelectSource(options.clip, options.rate);
     if (!file.LoadWhole(path))
         return false;
     SayWarnings(options, path, file.Record());
@@ -79,8 +90,7 @@ bool LoadMotion(const ShellOptions& options, const std::string& path, PictureMot
         return ShowScene(path, file, motion);
     if (isPackage && !LoadPackagedMotion(path, file.Scene(), inside))
         return false;
-    const CMotionFile& shown = isPackage ? inside : file.Motion();
-    motion = Shown(shown.motionRoot.Get(), TimingOf(shown));
+    motion = Shown(isPackage ? inside : file.Motion(), options.rate);
     return true;
 }
 
@@ -205,10 +215,11 @@ bool Draw(const ShellOptions& shell, const PictureOptions& options)
     const EPictureAnswer answer =
         isAnimated ? WriteAnimation(output, options, AnimationOf(options)) : RenderPicture(options, picture);
     if (answer == EPictureAnswer::NoPainter)
-        return Refuse(
-            "drawing needs gw_picture_painter.so next to the program, and the libraries that it loads");
+        return Refuse("no-painter", "drawing needs gw_picture_painter.so next to the program, and the "
+                                    "libraries that it loads");
     if (answer != EPictureAnswer::Done && answer != EPictureAnswer::Stopped)
-        return Refuse("the OpenGL driver cannot draw this picture without a display; Mesa's driver can");
+        return Refuse("no-display",
+                      "the OpenGL driver cannot draw this picture without a display; Mesa's driver can");
     if (isAnimated ? answer == EPictureAnswer::Done : WritePng(output, picture))
         return true;
     SayNotWritten(output);

@@ -19,12 +19,15 @@ bool TakePlan(const CRunPlan& plan, size_t shard, ShellOptions& options)
     const std::string planPath = options.files[0];
     if (!ReadOptionsJson(plan.options, ~kHowToRun, options, wrong))
     {
-        SayError(Printable(planPath) + ":1: the plan has an unknown option: " + Quoted(wrong));
+        Notice notice =
+            MakeNotice(planPath, "plan-option", "the plan has an unknown option: " + Quoted(wrong));
+        notice.where = 1;
+        SayNotice(options, notice);
         return false;
     }
     if (IsSameFile(options.report, planPath))
     {
-        SayError(Printable(options.report) + ": this is the plan; choose another file for the report");
+        SayError(options.report, "own-source", "this is the plan; choose another file for the report");
         return false;
     }
     options.files.clear();

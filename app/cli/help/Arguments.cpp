@@ -7,6 +7,7 @@
 #include "ManPage.h"
 #include "Numbers.h"
 #include "OptionTable.h"
+#include "Paths.h"
 #include "Streams.h"
 #include "Text.h"
 #include "Words.h"
@@ -222,6 +223,37 @@ EExit Print(const std::string& text)
     return EExit::Done;
 }
 
+// The extension of a result that goes into a folder. 'convert' and 'extract' find it themselves.
+struct FolderRow
+{
+    std::string_view command;
+    std::string_view extension;
+};
+constexpr FolderRow kFolderRows[] = {
+    {"align",   ".bvh"    },
+    {"doctor",  ".bvh"    },
+    {"dump",    ".html"   },
+    {"package", ".Kinetra"},
+    {"render",  ".png"    },
+    {"suggest", ".prf"    },
+};
+
+void NameInFolder(const ShellCommand& command, ShellOptions& options)
+{
+    const auto row = std::ranges::find(kFolderRows, command.name, &FolderRow::command);
+    std::string extension = row == std::end(kFolderRows) ? std::string() : std::string(row->extension);
+    if (command.name == "resave")
+        extension = SplitPath(options.files[0]).extension;
+    if (command.name == "transcode" && !options.format.empty())
+        extension = '.' + options.format;
+    if (extension.empty())
+        return;
+    for (std::string* output : {&options.output, &options.animate, &options.fix})
+        *output = InFolder(*output, options.files[0], extension);
+    if (command.operands == "IN OUT")
+        options.files[1] = InFolder(options.files[1], options.files[0], extension);
+}
+
 // Returns nothing if the command can run. Unknown options are reported before missing ones.
 std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv, ShellOptions& options)
 {
@@ -234,6 +266,10 @@ std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv
     } catch (const CLI::CallForHelp&)
     {
         return Print(CommandHelp(command));
+    } catch (const CLI::ArgumentMismatch& error)
+    {
+        wrong = error.what();
+        wrong = wrong.substr(0, wrong.find(':')) + ": a value is missing";
     } catch (const CLI::ParseError& error)
     {
         wrong = error.what();
@@ -256,6 +292,7 @@ std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv
     if (options.json && IsStandardOutput(output))
         return RefuseFor(command, "--json and the result would both go to standard output");
     options.draft = options.draft || !options.drafts.empty();
+    NameInFolder(command, options);
     return std::nullopt;
 }
 

@@ -34,7 +34,7 @@ constexpr uint64_t kPlanOptions =
     kShards;
 
 constexpr uint64_t kRenderOptions = kOutput | kFrame | kSize | kWith | kStrip | kForce | kSkipExisting |
-                                    kView | kBackground | kUpright | kAxes | kAnimate;
+                                    kView | kBackground | kUpright | kAxes | kAnimate | kRate | kClip;
 
 constexpr ShellCommand kCommands[] = {
     Row("convert", "SOURCE...", kConvertOptions, 0, RunConvert,
@@ -114,10 +114,11 @@ constexpr ShellCommand kCommands[] = {
         "gaitwright align walk.bvh -o walk-aligned.bvh"),
     Row("resave", "IN OUT", kForce, 0, RunResave,
         "Read a container and write it again, in the newest version.", "gaitwright resave old.orn new.orn"),
-    Row("dump", "FILE", kOutputFolder, kOutputFolder, RunDump,
+    Row("dump", "FILE", kOutput | kOutputFolder | kForce, 0, RunDump,
         "Write the contents of a container as linked pages, one per object, with a folding tree.\n"
-        "Open Index.htm in a browser; other roots have Index2.htm and so on. Existing pages are replaced.",
-        "gaitwright dump scene.orn --out-dir pages"),
+        "Open Index.htm in a browser; other roots have Index2.htm and so on. Existing pages are replaced.\n"
+        "-o writes everything to one page.",
+        "gaitwright dump scene.orn --out-dir pages", kOutput | kOutputFolder),
     Row("extract", "FILE", kOutput | kForce, kOutput, RunExtract,
         "Extract the motion file from a Kinetra file.", "gaitwright extract walk.Kinetra -o walk.htr"),
     Row("package", "IN OUT", kRate | kForce, kRate, RunPackage, "Wrap a motion file into a Kinetra file.",

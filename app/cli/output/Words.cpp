@@ -81,6 +81,12 @@ bool Refuse(std::string_view words)
     return false;
 }
 
+bool Refuse(const char* code, const std::string& words)
+{
+    SayError({}, code, words);
+    return false;
+}
+
 void SayWord(const ShellOptions& options, std::string_view words)
 {
     if (!options.quiet)

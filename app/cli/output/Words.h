@@ -20,8 +20,10 @@ void SayWarning(const ShellOptions& options, std::string_view words);
 void SayError(const std::string& path, const char* code, const std::string& words);
 /// Returns the first error that this process has printed; its words are empty before that.
 const Notice& FirstError();
-/// Same for an invalid command line. Always returns false, so that a check can return the result.
+/// Prints what is wrong with a command line. Always returns false, so that a check can return the result.
 bool Refuse(std::string_view words);
+/// Same for another error that is not about a file.
+bool Refuse(const char* code, const std::string& words);
 /// Same for information that is not a failure; prints nothing with --quiet.
 void SayWord(const ShellOptions& options, std::string_view words);
 /// Prints a failure. A warning is printed only without --quiet.

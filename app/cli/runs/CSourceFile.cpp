@@ -150,13 +150,18 @@ bool CSourceFile::Unpack(const std::string& path)
     COrrinStream scene;
     scene.SetPictureLimit(0);
     scene.LoadFile(m_kPath, false);
+    return (!isPackage && !FindPackage(scene).file) || OpenInside(path, scene);
+}
+
+bool CSourceFile::OpenInside(const std::string& path, const COrrinStream& scene)
+{
     const PackageBlocks blocks = FindPackage(scene);
     PackageFacts facts;
     if (blocks.file && ReadPackageFacts(*blocks.info, facts))
         return CopyBytes(path, blocks.file->Data(), FormatExtension(facts.format));
     const Finding& failure = scene.Record().Failure();
     m_kFailure = MakeNotice(path, failure ? failure : Finding{EFailure::Empty, 0, "MotionFile"});
-    return !isPackage;
+    return false;
 }
 
 bool CSourceFile::CopyBytes(const std::string& path, std::span<const std::byte> bytes,

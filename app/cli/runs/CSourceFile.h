@@ -10,6 +10,8 @@
 
 namespace gw {
 
+class COrrinStream;
+
 /// Whether the motion inside a Kinetra file is the source.
 enum class EPackage : uint8_t
 {
@@ -25,6 +27,9 @@ class CSourceFile
 public:
     /// Returns false, with the reason in Failure(), if a copy is needed and cannot be made.
     bool Open(const std::string& path, EPackage package = EPackage::Kept);
+    /// Opens the motion inside a Kinetra file that is loaded. Returns false, with the reason about `path` in
+    /// Failure(), if there is none, or if it cannot be copied.
+    bool OpenInside(const std::string& path, const COrrinStream& scene);
 
     /// Returns the file to read.
     const std::string& Path() const { return m_kPath; }

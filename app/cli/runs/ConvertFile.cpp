@@ -94,7 +94,7 @@ public:
         if (!Convert())
             return EConversion::Failed;
         COutputFile output;
-        if (!output.Open(job_.output, ResultExtension(options_)))
+        if (!output.Open(job_.output, ResultExtension(options_, job_.output)))
             return Fail(output.Failure());
         notices_.ShowAs(output.Path(), job_.output);
         // Another run may have made it meanwhile, such as the workers of a killed one, and may do so until

@@ -1,39 +1,33 @@
 #include "PackagedMotion.h"
 
-#include "CCustomData.h"
+#include "CKeyframeControl.h"
 #include "CMotionFile.h"
 #include "COrrinStream.h"
-#include "CPrivateFile.h"
 #include "CSourceFile.h"
 #include "EditMotion.h"
 #include "FindingWords.h"
 #include "HostBones.h"
-#include "PackageBlocks.h"
-#include "Paths.h"
 #include "ShellOptions.h"
-#include "SystemError.h"
-#include "Text.h"
+#include "Skeleton.h"
 #include "Words.h"
 
+#include <algorithm>
 #include <cmath>
+#include <vector>
 
 namespace gw {
 
 namespace {
 
-// Streams read only files, so the bytes inside a package are written to a temporary file first.
-std::optional<Notice> WhyNotLoaded(const std::string& path, std::span<const std::byte> bytes,
-                                   const char* extension, CMotionFile& motion)
+constexpr int kMostPerFrame = 4; // what bone maps with the lowest rate give
+
+// Returns whether the pose of a track at the end of the motion is the one some frames before.
+bool IsRepeated(const CKeyframeControl& track, size_t framesBefore)
 {
-    CPrivateFile inner;
-    if (!inner.CreateTemporary(extension) ||
-        !inner.Write(std::string_view(reinterpret_cast<const char*>(bytes.data()), bytes.size())))
-        return MakeNotice(path, "no-temporary-file",
-                          "a temporary file cannot be written" + TakeSystemErrorWords() +
-                              " (TMPDIR can name another folder)");
-    if (motion.Load(inner.Path()))
-        return std::nullopt;
-    return MakeNotice(path, motion.Record().Failure());
+    const auto repeats = [framesBefore](const auto& keys) {
+        return keys.size() <= framesBefore || keys[keys.size() - 1 - framesBefore] == keys[keys.size() - 1];
+    };
+    return repeats(track.m_kRotationKeys) && repeats(track.m_kPositionKeys);
 }
 
 } // namespace
@@ -51,11 +45,12 @@ bool LoadWhole(COrrinStream& scene, const std::string& path, const std::string& 
 
 std::optional<Notice> WhyNotUnpacked(const std::string& path, const COrrinStream& scene, CMotionFile& motion)
 {
-    const PackageBlocks blocks = FindPackage(scene);
-    PackageFacts facts;
-    if (blocks.file && ReadPackageFacts(*blocks.info, facts))
-        return WhyNotLoaded(path, blocks.file->Data(), FormatExtension(facts.format), motion);
-    return MakeNotice(path, {EFailure::Empty, 0, "MotionFile"});
+    CSourceFile inside;
+    if (!inside.OpenInside(path, scene))
+        return inside.Failure();
+    if (motion.Load(inside.Path()))
+        return std::nullopt;
+    return MakeNotice(path, motion.Record().Failure());
 }
 
 bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMotionFile& motion)
@@ -66,19 +61,32 @@ bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMot
     return !failure;
 }
 
+int FramesPerSourceFrame(const CMotionFile& motion)
+{
+    if (!motion.restRoot || motion.motionRoot->NameView() != kRootBone || motion.GetKeyCount() < 2)
+        return 1;
+    const std::vector<CNode*> nodes = NodesOf(*motion.motionRoot);
+    int count = 1;
+    while (count < kMostPerFrame && std::ranges::all_of(nodes, [count](CNode* node) {
+               const auto* track = RecordCast<CKeyframeControl>(node->GetControl());
+               return !track || IsRepeated(*track, static_cast<size_t>(count));
+           }))
+        ++count;
+    return count;
+}
+
 void SayRateOfResult(const ShellOptions& options, const std::string& path, const CMotionFile& motion)
 {
-    const float rate = motion.GetFrequency() > 0.0f ? 1.0f / motion.GetFrequency() : 0.0f;
-    const bool isResult = motion.restRoot && motion.motionRoot->NameView() == kRootBone;
-    if (!isResult || options.rate > 0.0f || motion.GetKeyCount() < 2)
+    const int count = FramesPerSourceFrame(motion);
+    if (count == 1 || options.rate > 0.0f || !(motion.GetFrequency() > 0.0f))
         return;
-    SayNotice(
-        options,
-        MakeNotice(path, "result-rate",
-                   "the header has the source's rate, " + std::to_string(std::lround(rate)) +
-                       ", but a conversion writes several frames per source frame (4 if the bone map's rate "
-                       "is 30), so other programs play it slowly; --rate R gives the true rate",
-                   ESeverity::Warning));
+    const long rate = std::lround(1.0f / motion.GetFrequency());
+    SayNotice(options, MakeNotice(path, "result-rate",
+                                  "the header has the source's rate, " + std::to_string(rate) +
+                                      ", but the conversion wrote " + std::to_string(count) +
+                                      " frames per source frame, so other programs play it slowly; --rate " +
+                                      std::to_string(rate * count) + " gives the true rate",
+                                  ESeverity::Warning));
 }
 
 bool LoadMotion(const ShellOptions& options, const std::string& path, float rate, CMotionFile& motion)

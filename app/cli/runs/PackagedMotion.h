@@ -23,8 +23,11 @@ bool LoadPackagedMotion(const std::string& path, const COrrinStream& scene, CMot
 /// file's, unless it is 0.
 bool LoadMotion(const ShellOptions& options, const std::string& path, float rate, CMotionFile& motion);
 
-/// Warns about the rate in the header of an .htr that a conversion wrote: it is the source's, although the
-/// result has more frames.
+/// Returns how many frames a result has for each frame of its source, 1 to 4; 1 for any other motion. A
+/// conversion writes the last source frame that often, so the repeated poses at the end are counted. A result
+/// that ends in a still pose counts as 4, which is what the installed bone maps give.
+int FramesPerSourceFrame(const CMotionFile& motion);
+/// Warns about the rate in the header of a result with several frames per source frame: it is the source's.
 void SayRateOfResult(const ShellOptions& options, const std::string& path, const CMotionFile& motion);
 
 } // namespace gw

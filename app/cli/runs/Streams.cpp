@@ -16,6 +16,9 @@ namespace {
 constexpr std::string_view kDescriptors[] = {"/dev/fd/", "/proc/self/fd/", "/dev/stdin", "/dev/stdout",
                                              "/dev/stderr"};
 
+// Formats of results other than .Kinetra.
+constexpr std::string_view kExchanged[] = {".htr", ".bvh", ".glb"};
+
 constexpr std::string_view kContainerMark = "TKOrrin Version";
 constexpr std::string_view kPackageMark = "MotionInfo"; // the name of a block at the start
 
@@ -59,13 +62,28 @@ bool IsStandardOutput(const std::string& path)
 
 std::string_view ResultExtension(const ShellOptions& options)
 {
-    static constexpr std::string_view kExtensions[] = {".htr", ".bvh", ".glb"};
-    for (const std::string_view extension : kExtensions)
+    for (const std::string_view extension : kExchanged)
     {
         if (extension.substr(1) == options.format)
             return extension;
     }
     return ".Kinetra";
+}
+
+std::string_view ResultExtension(const ShellOptions& options, const std::string& output)
+{
+    for (const std::string_view extension : kExchanged)
+    {
+        if (options.format.empty() && HasExtension(output, extension))
+            return extension;
+    }
+    return ResultExtension(options);
+}
+
+std::string InFolder(const std::string& output, const std::string& source, std::string_view extension)
+{
+    const bool isFolder = output.ends_with('/') || FolderExists(output);
+    return isFolder ? WithSeparator(output) + StemOf(source) + std::string(extension) : output;
 }
 
 std::string StemOf(const std::string& source)

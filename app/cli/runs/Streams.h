@@ -15,11 +15,16 @@ inline constexpr std::string_view kStandardStream = "-";
 bool IsStream(const std::string& path);
 /// Returns whether what is written to a path goes to standard output, where messages must not get between.
 bool IsStandardOutput(const std::string& path);
-/// Returns the extension of a result, by the option --format: ".Kinetra" unless it names another one.
+/// Returns the extension of a result by the option --format; ".Kinetra" without it.
 std::string_view ResultExtension(const ShellOptions& options);
+/// Same for an output that may be a pipe: without --format, its name decides.
+std::string_view ResultExtension(const ShellOptions& options, const std::string& output);
 /// Returns the stem of a source's file name, for the names of files made from it. Standard input has one
 /// too.
 std::string StemOf(const std::string& source);
+/// Returns the path of a result. If the output is a folder, the result lies in it, under the source's stem
+/// with an extension.
+std::string InFolder(const std::string& output, const std::string& source, std::string_view extension);
 /// Returns the extension of a motion or container, found in its first bytes; empty if the format is unknown.
 std::string_view ExtensionOfContent(std::string_view start);
 
