@@ -97,7 +97,10 @@ void CConversionSection::AppendHead(CMarkup& page) const
     page.Raw("<h2><span class=\"source\">").FileName(motion_.source).Raw("</span> → <span class=\"result\">");
     page.FileName(motion_.result).Raw("</span></h2>\n<p class=\"about\">profile ").Name(motion_.profile);
     page.Raw(" · ").Integer(sums.frameCount).Raw(" frames compared · ");
-    page.Number(sums.frameCount * motion_.measured->detail.secondsPerFrame, 2).Raw(" s</p>\n");
+    page.Number(sums.frameCount * motion_.measured->detail.secondsPerFrame, 2).Raw(" s");
+    if (!motion_.model.empty())
+        page.Raw(" · <a href=\"").Link(motion_.model).Raw("\">3D model (.glb)</a>");
+    page.Raw("</p>\n");
     if (!motion_.advice.empty())
         page.Raw("<p class=\"about\">").Raw(motion_.advice).Raw("</p>\n");
 }

@@ -47,6 +47,21 @@ CMarkup& CMarkup::Name(std::string_view name)
     return name.size() > kLongestName ? Raw("…") : *this;
 }
 
+CMarkup& CMarkup::Link(std::string_view path)
+{
+    constexpr std::string_view kPlain = "abcdefghijklmnopqrstuvwxyzABCDEFGHIJKLMNOPQRSTUVWXYZ0123456789-_./";
+    constexpr const char* kDigits = "0123456789ABCDEF";
+    for (const char c : path)
+    {
+        const auto byte = static_cast<unsigned char>(c);
+        if (kPlain.find(c) != kPlain.npos)
+            m_kText += c;
+        else
+            Raw("%").Raw({&kDigits[byte >> 4], 1}).Raw({&kDigits[byte & 15], 1});
+    }
+    return *this;
+}
+
 CMarkup& CMarkup::FileName(std::string_view path)
 {
     const PathParts parts = SplitPath(path);

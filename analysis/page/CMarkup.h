@@ -19,6 +19,8 @@ public:
     CMarkup& Name(std::string_view name);
     /// Appends the file name of a path, with the whole path in its tool tip.
     CMarkup& FileName(std::string_view path);
+    /// Appends a relative path as a link inside a quoted attribute.
+    CMarkup& Link(std::string_view path);
     /// Appends text from a file as a JSON string, quotes included, that is safe inside an element.
     CMarkup& JsonText(std::string_view text);
     /// Appends bytes in base64.

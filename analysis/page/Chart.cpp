@@ -48,7 +48,11 @@ CAxis HeightAxis(const Chart& chart, const std::vector<ThinnedCurve>& curves)
             largest = std::max(largest, static_cast<double>(point.value));
         }
     }
-    return least <= largest ? CAxis(least, largest, kHeightSteps) : CAxis(0.0, 1.0, kHeightSteps);
+    if (!(least <= largest))
+        return {0.0, 1.0, kHeightSteps};
+    if (chart.fromZero && least > -0.01 * chart.leastRange)
+        least = 0.0;
+    return {least, std::max(largest, least + chart.leastRange), kHeightSteps};
 }
 
 // Draws one chart.

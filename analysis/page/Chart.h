@@ -43,7 +43,8 @@ struct Chart
     std::vector<ChartCurve> curves;
     std::vector<ChartStrip> strips;
     std::span<const ChartMark> marks;
-    bool fromZero = false; ///< include 0 on the axis, whatever the curves' range is
+    double leastRange = 1.0; ///< of the axis, so that rounding errors do not look like a result
+    bool fromZero = false;   ///< include 0 on the axis, whatever the curves' range is
 };
 
 /// Appends a chart; nothing if no curve has any frames. Curves are drawn with at most about `mostPoints`

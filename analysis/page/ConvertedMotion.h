@@ -26,7 +26,8 @@ struct ConvertedMotion
     const MeasuredConversion* measured = nullptr;
     /// the same motion converted by default; null if this one was
     const MeasuredConversion* plain = nullptr;
-    std::string advice; ///< a sentence about options that give a better result; may be empty
+    std::string model = {}; ///< link to a .glb file with the result, relative to the page; may be empty
+    std::string advice;     ///< a sentence about options that give a better result; may be empty
 };
 
 } // namespace gw

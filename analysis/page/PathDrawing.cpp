@@ -99,10 +99,11 @@ void AppendPaths(CMarkup& page, const std::vector<Vec3>& source, const std::vect
     const Ground ground{&source, &result};
     if (!std::isfinite(ground.scale) || !(ground.scale > 0.0))
         return;
-    page.Raw("<figure class=\"chart path\"><figcaption><b>Way of the hips</b> from above, from the dot on"
-             "<span class=\"legend\"> <i class=\"key source\"></i>source <i class=\"key result\"></i>result"
-             "</span></figcaption>\n<svg viewBox=\"-6 -6 312 152\" role=\"img\" aria-label=\"Way of the hips "
-             "from above\">");
+    page.Raw(
+        "<figure class=\"chart path\"><figcaption><b>Path of the hips</b> from above, starting at the dot"
+        "<span class=\"legend\"> <i class=\"key source\"></i>source <i class=\"key result\"></i>result"
+        "</span></figcaption>\n<svg viewBox=\"-6 -6 312 152\" role=\"img\" aria-label=\"Path of the hips "
+        "from above\">");
     AppendWay(page, ground, source, "source", mostPoints);
     AppendWay(page, ground, result, "result", mostPoints);
     AppendScale(page, ground);

@@ -133,6 +133,7 @@ public:
                 const Vec3 seen = m_kCamera.Project(point, center);
                 m_fHalfWidth = std::max(m_fHalfWidth, std::fabs(seen.x));
                 m_kHeight.Add(seen.y);
+                m_kHeight.Add(m_kCamera.Project({point.x, m_fFloor, point.z}, center).y); // the shadow
             });
         }
         m_kHeight.Add(0.0f); // the floor below the figure

@@ -106,6 +106,7 @@ bool WriteComparison(const ShellOptions& options, const std::string& profilePath
     motion.sourceClip = source;
     motion.resultClip = result;
     motion.measured = &measured;
+    motion.model = ModelLink(options.html, motion.result);
     CPagePart part(1, 1);
     part.Show(motion);
     CConversionPage page;

@@ -42,6 +42,8 @@ bool CanTranscode(const ShellOptions& options)
 {
     const std::string& source = options.files[0];
     const std::string output = OutputName(options);
+    if (FolderExists(output))
+        return Refuse(Printable(output) + ": a result in a folder needs --format");
     if (HasExtension(output, ".bvh") || HasExtension(output, ".glb"))
     {
         if (options.frameScale == 1.0f)

@@ -145,7 +145,8 @@ void CRunSummary::TakeCause(const std::string& source, const std::vector<Notice>
         m_kFirst = cause;
     ++m_uiFailed;
     if (m_kFailed.size() < kNamedFailures)
-        m_kFailed.push_back(FirstLine(NoticeLine(cause)));
+        m_kFailed.push_back((cause.path == source ? "" : Printable(source) + ": ") +
+                            FirstLine(NoticeLine(cause)));
 }
 
 void CRunSummary::TakeFigures(std::string_view record)

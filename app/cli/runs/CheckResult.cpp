@@ -4,8 +4,11 @@
 #include "CShellConversion.h"
 #include "ConvertFile.h"
 #include "HTRPose.h"
+#include "Paths.h"
 #include "ShellOptions.h"
 #include "SourceTiming.h"
+
+#include <filesystem>
 
 namespace gw {
 
@@ -26,6 +29,19 @@ ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob&
     motion.sourceClip = SourceClipOf(conversion);
     motion.resultClip = ClipOf(conversion.Result());
     return motion;
+}
+
+std::string ModelLink(const std::string& page, const std::string& result)
+{
+    std::error_code error;
+    const std::filesystem::path folder =
+        std::filesystem::absolute(page, error).lexically_normal().parent_path();
+    const std::string link =
+        std::filesystem::absolute(result, error).lexically_normal().lexically_relative(folder);
+    const std::string beside = SplitPath(result).stem + ".glb";
+    if (HasExtension(result, ".glb") && !link.starts_with(".."))
+        return link;
+    return FileExists(folder / beside) ? beside : std::string();
 }
 
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, const std::string& profilePath)

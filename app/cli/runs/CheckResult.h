@@ -20,6 +20,10 @@ MotionClip SourceClipOf(const CFileConversion& conversion);
 /// to the conversion. The result must already be saved: its tracks are changed to what its file contains.
 ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job);
 
+/// Returns the link from a page to a .glb file with a result: the result itself if it lies in the folder of
+/// the page or below, or a file of its stem next to the page. Empty if there is none.
+std::string ModelLink(const std::string& page, const std::string& result);
+
 /// Compares source and result with the profile that the conversion used. Returns no value if the profile can
 /// no longer be read or the motion has no frames.
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion,

@@ -203,8 +203,10 @@ void CJobSteps::Check()
     motion.plain = account_.plainCheck ? &*account_.plainCheck : nullptr;
     if (account_.betterCheck)
         motion.advice = BetterWords(*account_.check, *account_.betterCheck);
-    if (tools_.part)
-        tools_.part->Show(motion);
+    if (!tools_.part)
+        return;
+    motion.model = ModelLink(options_.html, job_.output);
+    tools_.part->Show(motion);
 }
 
 // Measures what the default conversion gave, or what more options would give.
