@@ -27,6 +27,14 @@ class RunPage(CliTest):
         self.assertEqual(first[1], second[1], "figures of skipped files")
         self.assertEqual(first[0].split("<section")[1:], second[0].split("<section")[1:], "and details")
 
+    def test_a_page_links_the_model_beside_it(self):
+        self.write("pages/a b.glb", "old")
+        for output, link in (("pages/sub/c%.glb", "sub/c%25.glb"), ("a b.Kinetra", "a%20b.glb"), ("c.glb", None)):
+            (self.folder / output).parent.mkdir(exist_ok=True)
+            self.succeed("convert", WALK, "-o", output, "--html", "pages/page.html", "--force")
+            links = [part.split('"')[0] for part in self.page("pages/page.html")[0].split('<a href="')[1:]]
+            self.assertEqual(links, [link] if link else [], output)
+
     def test_ten_thousand_files_make_a_small_page(self):
         self.write("takes/a.bvh", WALK.read_bytes())
         self.succeed("plan", "takes", "--shards", 1, "-o", "plan.jsonl", "--out-dir", "out")

@@ -79,6 +79,10 @@ class Pictures(CliTest):
         self.assertEqual([name for name, _ in found].count("fcTL"), 7)
         numbers = [body[:4] for name, body in found if name in ("fcTL", "fdAT")]
         self.assertEqual(numbers, [number.to_bytes(4, "big") for number in range(len(numbers))])
+        self.succeed("convert", WALK, "-o", "walk.Kinetra")
+        for options, pictures in (([], 67), (["--rate", "30"], 268)):
+            result = self.succeed("render", "walk.Kinetra", "--animate", "moves.png", *SIZE, "--json", "--force", *options)
+            self.assertEqual(json.loads(result.out)["pictures"], pictures, "a result lasts as long as its source")
 
 
 class Refusals(CliTest):

@@ -17,6 +17,7 @@ class Streams(CliTest):
     def test_a_stream_gives_the_bytes_of_a_file(self):
         self.succeed("align", "walk.bvh", "-o", "aligned.bvh")
         self.succeed("transcode", "walk.htr", "walk-2.bvh")
+        self.succeed("dump", "walk.Kinetra", "-o", "dump.html")
         rows = [  # arguments, source, the file with the same bytes as standard output
             ("convert -", "walk.bvh", "walk.Kinetra"),
             ("convert - -o - --format htr", "walk.bvh", "walk.htr"),
@@ -25,6 +26,7 @@ class Streams(CliTest):
             ("align - -o -", "walk.bvh", "aligned.bvh"),
             ("transcode - - --format bvh", "walk.htr", "walk-2.bvh"),
             ("doctor - --fix -", "walk.bvh", "walk.bvh"),
+            ("dump - -o -", "walk.Kinetra", "dump.html"),
         ]
         known = self.files()
         for line, source, expected in rows:
@@ -38,14 +40,14 @@ class Streams(CliTest):
             self.assertEqual(named.replace("walk.bvh", "-"), piped)
 
     def test_pipes_and_devices_are_written_and_stay(self):
-        for name in ("in", "out"):
+        for name in ("in", "out.htr"):
             os.mkfifo(self.folder / name)
         writer = threading.Thread(target=lambda: (self.folder / "in").write_bytes(WALK.read_bytes()))
         taken = []
-        reader = threading.Thread(target=lambda: taken.append((self.folder / "out").read_bytes()))
+        reader = threading.Thread(target=lambda: taken.append((self.folder / "out.htr").read_bytes()))
         for thread in (writer, reader):
             thread.start()
-        self.succeed("convert", "in", "-o", "out", "--format", "htr")
+        self.succeed("convert", "in", "-o", "out.htr")
         for thread in (writer, reader):
             thread.join()
         self.assertEqual(taken, [self.read("walk.htr")])
@@ -55,6 +57,17 @@ class Streams(CliTest):
         self.assertEqual(full.code, FAILED)
         self.assert_words(full, ["/dev/full", "No space left on device"])
         self.assertEqual(self.files(), known)
+
+    def test_a_result_in_a_folder_has_the_name_of_its_source(self):
+        for line, name in (("convert walk.bvh -o {}", "walk.Kinetra"), ("convert walk.bvh -o {}/ --format bvh", "walk.bvh"),
+                           ("extract walk.Kinetra -o {}", "walk.htr"), ("suggest walk.bvh -o {}", "walk.prf"),
+                           ("align - -o {}", "stdin.bvh"), ("dump walk.Kinetra -o {}", "walk.html"),
+                           ("transcode walk.htr {} --format glb", "walk.glb"), ("doctor walk.bvh --fix {}", "walk.bvh"),
+                           ("package walk.htr {} --rate 30", "walk.Kinetra"), ("resave walk.Kinetra {}", "walk.Kinetra")):
+            folder = self.folder / line.split()[0] / name
+            folder.mkdir(parents=True)
+            self.succeed(*line.format(folder).split(), given=WALK.read_bytes())
+            self.assertEqual([path.name for path in folder.iterdir()], [name])
 
     def test_what_no_stream_can_be_is_refused(self):
         for line, code in (("convert -", FAILED), ("info /dev/zero", FAILED),
