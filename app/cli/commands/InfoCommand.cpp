@@ -109,6 +109,13 @@ void WriteClips(CJsonWriter& json, const ImportFacts& facts)
     json.EndArray();
 }
 
+// Returns how many frames of a result belong to a source frame; 1 if this is not known, or if a rate was
+// given.
+int SourceShare(const CSceneFile& file)
+{
+    return file.IsScene() || file.HasGivenRate() ? 1 : FramesPerSourceFrame(file.Motion());
+}
+
 void Print(const std::string& path, CSceneFile& file)
 {
     std::printf("file:    %s\nformat:  %s\n", Printable(path).c_str(), FormatOf(file).c_str());
@@ -118,6 +125,9 @@ void Print(const std::string& path, CSceneFile& file)
     PrintClips(file.Motion().imported);
     if (!file.IsScene() || timing.frames != 0)
         PrintTiming(timing);
+    if (const int count = SourceShare(file); count > 1)
+        std::printf("source:  %d frames per source frame; %g per second is the source's speed\n", count,
+                    timing.Rate() * static_cast<float>(count));
     PrintBones(file.Nodes());
     if (file.IsContainer())
         PrintObjects(file.Scene());
@@ -134,6 +144,7 @@ void WriteJson(const std::string& path, CSceneFile& file)
     json.Key("file").Text(path);
     json.Key("format").Text(FormatOf(file));
     WriteTiming(json, TrackTiming(file.FirstTrack()));
+    json.Key("framesPerSourceFrame").Integer(SourceShare(file));
     WriteBones(json, file.Nodes());
     WriteClips(json, file.Motion().imported);
     WriteRecord(json, path, file.Record());
@@ -169,7 +180,7 @@ EExit RunInfo(const ShellOptions& options)
     else
         Print(path, file);
     SayWarnings(options, path, file.Record());
-    if (!file.IsScene())
+    if (!file.IsContainer()) // the host knows how to play a package
         SayRateOfResult(options, path, file.Motion());
     if (!file.IsDamaged())
         return EExit::Done;

@@ -46,6 +46,8 @@ public:
     bool LoadWhole(const std::string& path);
 
     bool IsContainer() const { return m_bContainer; }
+    /// Returns whether SelectSource has replaced the file's rate.
+    bool HasGivenRate() const { return m_fRate > 0.0f; }
     bool IsDamaged() const { return m_bContainer && Record().Failure(); }
     const CFailureRecord& Record() const { return m_bContainer ? m_kScene.Record() : m_kMotion.Record(); }
     const Finding& Failure() const { return Record().Failure(); }
