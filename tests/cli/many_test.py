@@ -36,6 +36,18 @@ class Many(CliTest):
                 self.assertEqual((summary["converted"], summary["failed"], summary["left"]), (len(stems), 1, left))
                 self.assertEqual([p.name for p in sorted(out.iterdir())], [s + ".Kinetra" for s in stems])
 
+    def test_a_summary_has_the_reason_and_the_source_of_each_failure(self):
+        (self.folder / "out").mkdir()
+        for stem in "ac":
+            (self.folder / "out" / (stem + ".Kinetra")).mkdir()
+        result = self.with_assets("convert", "takes", "--out-dir", "out", "--keep-going", "--force")
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["\n  takes/a.bvh: out/a.Kinetra: ", "\n  takes/b.bvh:17: ", "0 converted"])
+        nothing = self.run_program("convert", "takes", "--out-dir", "new", "--keep-going", "--data-dir", "takes")
+        self.assert_words(nothing, ["2  the file cannot be opened: No such file or directory"])
+        refused = self.with_assets("convert", "takes", "--out-dir", "new", "--drafts", "takes/a.bvh")
+        self.assert_words(refused, ["takes/a.bvh: the folder cannot be created: Not a directory"])
+
     def test_a_second_run_does_only_what_is_missing(self):
         self.succeed("convert", "takes/a.bvh", "--out-dir", "out")
         first = self.read("out/a.Kinetra")

@@ -120,8 +120,10 @@ void CRunSummary::Take(const std::string& source, EConversion outcome, std::stri
 
 void CRunSummary::Kind::Add(const Notice& notice)
 {
+    const std::string message = FirstLine(notice.words);
+    common = sources == 0 || common == message ? message : std::string();
     ++sources;
-    words = KindWords(notice);
+    words = sources == 1 || common.empty() ? KindWords(notice) : common;
 }
 
 void CRunSummary::TakeWarnings(const std::vector<Notice>& notices)

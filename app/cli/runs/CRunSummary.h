@@ -25,11 +25,13 @@ public:
     void Tell(const ShellOptions& options, const RunTally& tally, bool areFailuresTold) const;
 
 private:
-    /// How often a kind of notice occurred, and one of them.
+    /// How often a kind of notice occurred, and what to call it.
     struct Kind
     {
         size_t sources = 0;
         std::string words;
+        std::string
+            common; ///< the message, if it was the same for all sources: it may name the system's reason
 
         void Add(const Notice& notice);
     };

@@ -57,10 +57,14 @@ bool MakeOutputFolder(const ShellOptions& options)
                  "a folder is needed; only a single result can be a stream");
         return false;
     }
-    if (options.outputFolder.empty() || options.dryRun || CreateFolder(options.outputFolder))
-        return true;
-    SayError(options.outputFolder, "no-folder", "the folder cannot be created" + TakeSystemErrorWords());
-    return false;
+    for (const std::string& folder : {options.outputFolder, options.drafts})
+    {
+        if (folder.empty() || options.dryRun || CreateFolder(folder))
+            continue;
+        SayError(folder, "no-folder", "the folder cannot be created" + TakeSystemErrorWords());
+        return false;
+    }
+    return true;
 }
 
 std::string ResumeDrafts(const std::string& stateFolder)

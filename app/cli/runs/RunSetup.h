@@ -8,7 +8,8 @@ namespace gw {
 bool IsRunPossible(const ShellOptions& options);
 /// Returns whether all jobs write different files; prints those that conflict.
 bool AreOutputsApart(const CFileRun::Jobs& jobs);
-/// Creates the output folder if one is given. Returns false, after printing the reason, if that fails.
+/// Creates the output folder and that of the drafts, if they are given. Returns false, after printing the
+/// reason, if that fails.
 bool MakeOutputFolder(const ShellOptions& options);
 /// Returns the location of the --resume state: the output folder, otherwise the folder of the sources.
 RunState StateOf(const ShellOptions& options);
