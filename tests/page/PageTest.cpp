@@ -129,7 +129,7 @@ TEST(Page, ShowsTheWaysOfBothHipsInOneScale)
         figure.Move("LowerTorso", {0.0f, 0.0f, 50.0f * static_cast<float>(frame)});
     };
     const std::string page = CMadeConversion(walking).Page();
-    const size_t way = page.find("class=\"curve result\"", page.find("Way of the hips"));
+    const size_t way = page.find("class=\"curve result\"", page.find("Path of the hips"));
     ASSERT_NE(way, page.npos);
     EXPECT_EQ(page.substr(page.find(" d=", way), 14), " d=\"M150.0 0.0") << "begins at the far edge";
     EXPECT_TRUE(Has(page, "L150.0 130.0\"")) << "and ends at the near one";
