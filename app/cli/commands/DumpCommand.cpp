@@ -48,7 +48,7 @@ EExit WriteOnePage(const ShellOptions& options, const std::vector<CObject*>& roo
     CSinglePageDump dump;
     for (CObject* root : roots)
         dump.WriteSite(*root);
-    if (!dump.WriteTo(output.Path()))
+    if (dump.FailedCount() != 0 || !dump.WriteTo(output.Path()))
         return Fail(options.output, "the page cannot be written" + TakeSystemErrorWords());
     return output.DeliverOrSay() ? TellWritten(options, options.files[0], options.output) : EExit::Failed;
 }

@@ -76,8 +76,8 @@ bool CSinglePageDump::Write(const COrnHTMLPage& page, const std::string& fileNam
     const std::string text = TextOf(page);
     if (fileName.starts_with("TreeView"))
         m_kTrees += WithLinks(ScriptOf(text), kTreeLink);
-    if (!fileName.starts_with("OrnHTML"))
-        return true;
+    if (!fileName.starts_with("OrnHTML") || text.empty())
+        return !text.empty();
     std::string_view body = text;
     body.remove_prefix(body.starts_with(kHTMLCodePage) ? sizeof kHTMLCodePage : 0); // and the line feed
     m_kSections.Write("<div id=\"" + fileName.substr(0, fileName.size() - kExtension.size()) + "\">\n" +

@@ -36,9 +36,8 @@ std::string ModelLink(const std::string& page, const std::string& result)
     std::error_code error;
     const std::filesystem::path folder =
         std::filesystem::absolute(page, error).lexically_normal().parent_path();
-    const std::string link =
-        std::filesystem::absolute(result, error).lexically_normal().lexically_relative(folder);
-    const std::string beside = SplitPath(result).stem + ".glb";
+    std::string link = std::filesystem::absolute(result, error).lexically_normal().lexically_relative(folder);
+    std::string beside = SplitPath(result).stem + ".glb";
     if (HasExtension(result, ".glb") && !link.starts_with(".."))
         return link;
     return FileExists(folder / beside) ? beside : std::string();
