@@ -22,9 +22,11 @@ struct FileDialogSetup
 {
     std::string defaultExtension; ///< without dot
     std::string filter;
-    std::string initialFolder; ///< empty for the system's default
-    std::string fileName = {}; ///< proposed name, without folder
-    std::string note = {};     ///< text shown in the dialog: what will happen to the files
+    std::string initialFolder;    ///< empty for the system's default
+    std::string fileName = {};    ///< proposed name, without folder
+    std::string note = {};        ///< text shown in the dialog: what will happen to the files
+    std::string moreFilters = {}; ///< appended to the filter
+    std::string openedLast = {};  ///< the dialog begins with the first filter that shows such a file
 };
 
 /// A selected folder, with trailing separator, and the number of the filter selected with it, starting at 1.

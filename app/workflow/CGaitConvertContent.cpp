@@ -19,6 +19,11 @@ namespace gw {
 namespace {
 
 constexpr std::string_view kProfileExtension = ".prf";
+constexpr const char* kMoreFilters =
+    "Other motions (*.htr, *.cha, *.chb)|*.htr;*.cha;*.chb|"
+    "Models with motions (*.fbx, *.gltf, *.glb, *.vrm, *.dae)|"
+    "*.fbx;*.gltf;*.glb;*.vrm;*.dae|"
+    "All of these|*.bvh;*.orn;*.htr;*.cha;*.chb;*.fbx;*.gltf;*.glb;*.vrm;*.dae||";
 constexpr const char* kFolderSetting = "MotionSource";
 
 void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
@@ -32,6 +37,7 @@ void SetScene(CMotionView* view, CNode* root, const SourceTiming& timing)
 CGaitConvertContent::CGaitConvertContent(CContentWindow& window, CPlatform& platform)
     : window_(window), platform_(platform)
 {
+    m_kResultMotion.SetProgress(ProgressOf("Saving")); // reading the base skeleton takes no time
     m_kResources.OpenLibrary(platform.DataFolder() + kResourceLibrary, platform.ThreadLocale());
 }
 
@@ -75,13 +81,31 @@ int CGaitConvertContent::OpenSource()
 {
     if (!ConfirmDiscard())
         return 0;
-    const auto path = window_.AskOpenFile({"bvh", Message(kOpenFilterMessage), SourceFolder()});
+    const auto path = window_.AskOpenFile({.defaultExtension = "bvh",
+                                           .filter = Message(kOpenFilterMessage),
+                                           .initialFolder = SourceFolder(),
+                                           .moreFilters = kMoreFilters,
+                                           .openedLast = m_kSourcePath});
     return path ? Open(*path) : 1;
 }
 
 int CGaitConvertContent::OpenFile(const std::string& path)
 {
     return ConfirmDiscard() ? Open(path) : 0;
+}
+
+const std::vector<std::string>& CGaitConvertContent::Clips() const
+{
+    static const std::vector<std::string> kNone;
+    return m_bSourceIsContainer ? kNone : m_kSourceMotion.imported.clips;
+}
+
+int CGaitConvertContent::ChooseClip(const std::string& clip)
+{
+    m_kSourceMotion.importChoice.clip = clip;
+    const int opened = OpenFile(m_kSourcePath);
+    m_kSourceMotion.importChoice = {};
+    return opened;
 }
 
 int CGaitConvertContent::OpenDropped(const std::string& path)
@@ -100,7 +124,7 @@ int CGaitConvertContent::Open(const std::string& path)
     window_.RedrawFrame();
     const CWaitCursor wait(window_);
     ForgetFailedSave();
-    m_kMendable.clear();
+    m_kNextSteps.SetMendable({});
     if (m_pkSourceView)
         m_pkSourceView->Stop();
     bool loaded = false;
@@ -145,7 +169,7 @@ bool CGaitConvertContent::LoadSource(const std::string& path)
     if (!HasExtension(path, kSceneExtension))
         return LoadMotion(m_kSourceMotion, path);
     CFailureRecord record;
-    const bool loaded = LoadSourceScene(path, m_spkSourceScene, record);
+    const bool loaded = LoadSourceScene(path, m_spkSourceScene, record, ProgressOf("Opening"));
     Notify(path, record);
     m_bSourceIsContainer = m_bSourceIsContainer || loaded;
     return loaded;
@@ -153,7 +177,7 @@ bool CGaitConvertContent::LoadSource(const std::string& path)
 
 bool CGaitConvertContent::LoadMotion(CMotionFile& motion, const std::string& path)
 {
-    motion.SetProgress([this](size_t done, size_t total) { ShowPercent("Opening", done, total); });
+    motion.SetProgress(ProgressOf("Opening"));
     const bool loaded = motion.Load(path);
     Notify(path, motion.Record());
     return loaded;
@@ -168,7 +192,7 @@ void CGaitConvertContent::ShowSource()
     m_kResultFile.clear();
     if (m_bSourceIsContainer)
         AttachBoneMeshes(root);
-    FindUp();
+    m_kNextSteps.FindUp(root, Timing());
     SetScene(m_pkSourceView.get(), root,
              m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
     LoadMotion(m_kBaseMotion, BaseFile());

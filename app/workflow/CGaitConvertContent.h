@@ -1,10 +1,10 @@
 #pragma once
 
 #include "CConversion.h"
-#include "CMapFits.h"
 #include "CMarksMeter.h"
 #include "CMotionFile.h"
 #include "CMotionView.h"
+#include "CNextSteps.h"
 #include "COrrinStream.h"
 #include "CPlatform.h"
 #include "CProfileOwner.h"
@@ -17,6 +17,7 @@
 #include "ResultFile.h"
 
 #include <cstdint>
+#include <functional>
 #include <memory>
 #include <optional>
 #include <span>
@@ -63,6 +64,12 @@ public:
     int OpenSource();
     /// Opens a path like OpenSource after the dialog: a recent file, or one from the command line.
     int OpenFile(const std::string& path);
+    /// Returns the names of the clips in the open source; none for formats without clips.
+    const std::vector<std::string>& Clips() const;
+    /// Returns the one that is open.
+    const std::string& OpenClip() const { return m_kSourceMotion.imported.clip; }
+    /// Opens another clip of the open source.
+    int ChooseClip(const std::string& clip);
     /// Handles a drop on the window: opens a motion, offers a batch run for a folder, selects a profile.
     int OpenDropped(const std::string& path);
     int ConvertMotion();
@@ -138,13 +145,8 @@ public:
     void RunRemedy(ERemedy remedy);
     /// Runs the first remedy that the result's view offers, if any.
     void TakeOffer();
-    /// Return what the empty source view and the empty result view say.
-    Hint SourceHint() const;
-    Hint ResultHint() const;
     /// Returns the remedies for the notices of a step.
     std::vector<Offer> OffersFor(std::span<const Notice> notices) const;
-    /// Returns the first lines of the first error among the notices of a step; empty without an error.
-    std::string SummaryOf(std::span<const Notice> notices) const;
 
     // Help
 
@@ -200,8 +202,8 @@ private:
     void PutBackResult(const CMotionFile& before);
 
     // LongStep.cpp
-    void ShowProgress(const char* verb, const std::string& amount);
-    void ShowPercent(const char* verb, size_t done, size_t total);
+    std::function<void(size_t, size_t)> ProgressOf(const char* verb);
+    void ShowProgress(const char* verb, size_t done, size_t total);
 
     // DraftProfile.cpp
     std::string DraftName() const;
@@ -211,7 +213,6 @@ private:
     void OpenMendedCopy();
 
     // Offers.cpp
-    void FindUp();
     void NotifyOfPose();
     void NotifyOfUpAxis();
     void MeasureFits();
@@ -220,10 +221,11 @@ private:
     void UseBestMap();
     std::string SaveAdapted(const ProfileChoice& choice);
     bool SaveNewMap(const std::string& path, const std::string& text);
-    void OfferMap(Hint& hint) const;
-    Hint ReadyHint() const;
-    std::string AlignmentReason() const;
+    StepState State() const;
+
+    // Hints.cpp
     void ShowCaptions();
+    std::string SourceNote() const;
     bool HasChangedSince() const;
 
     // ConvertBatch.cpp
@@ -290,10 +292,8 @@ private:
     std::vector<std::string> m_kProfileNames;       ///< every name ever listed; grows with each refresh
     std::string m_kTitle;                           ///< last text passed to SetTitle
     ConversionChoices m_kChoices;
-    bool m_bFollows = false;                ///< both views keep the figure in the middle
-    CMapFits m_kFits;                       ///< of the installed bone maps to the open source
-    std::string m_kUpAxis;                  ///< of the source, if it is not Y
-    std::string m_kMendable;                ///< the file read last, if it has faults that can be repaired
+    bool m_bFollows = false; ///< both views keep the figure in the middle
+    CNextSteps m_kNextSteps;
     std::string m_kSavedPath;               ///< of the open source's last saved result
     std::string m_kResultFile;              ///< the file with the result; empty if it is not saved
     std::optional<ResultOrigin> m_kOrigin;  ///< of the result in its view; null if the view is empty

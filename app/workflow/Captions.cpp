@@ -56,6 +56,8 @@ std::string ChoiceWords(const ConversionChoices& choices)
     std::string words = choices.align ? "aligned" : "";
     if (choices.faithful)
         words += words.empty() ? "faithful" : ", faithful";
+    if (choices.faithful && !choices.holdHands)
+        words += " (hands free)";
     return words;
 }
 

@@ -14,6 +14,7 @@ struct ResultOrigin
     CMapRowTable rows;
     ConversionChoices choices;
     bool plantsFeet = true;
+    SourceTiming timing; ///< of the result
 };
 
 /// Returns a view's caption: "walk.bvh: 69 frames at 30 fps, plays at double speed". The views play

@@ -15,7 +15,6 @@ int CGaitConvertContent::ConvertMotion()
     const CWaitCursor wait(window_);
     ForgetFailedSave();
     ForViews(&CMotionView::Stop);
-    ClearMarks();
     const CMotionFile before(m_kResultMotion);
     ReloadResult();
     if (m_pkProfile)
@@ -31,7 +30,10 @@ int CGaitConvertContent::ConvertMotion()
         return 0;
     }
     if (m_bConversionFailed)
+    {
+        ShowCaptions();
         return 0;
+    }
     if (m_pkSourceView)
         m_pkSourceView->Seek(0, kScrollRange);
     m_bConverted = true;
@@ -71,11 +73,11 @@ bool CGaitConvertContent::Retarget(bool heedsShift)
         return false;
     }
     const bool useLegs = !heedsShift || !window_.IsKeyDown(EKey::LeftShift);
-    conversion.Run(useLegs, [this](size_t done, size_t total) { ShowPercent("Converting", done, total); });
+    conversion.Run(useLegs, ProgressOf("Converting"));
     const SourceTiming result = TimingOf(m_kResultMotion);
     if (m_pkResultView)
         m_pkResultView->SetScene(m_kResultMotion.motionRoot.Get(), result.FrameStep(), result.lastFrame);
-    m_kOrigin = {MapName(), m_pkProfileDialog->Rows(), m_kChoices, useLegs};
+    m_kOrigin = {MapName(), m_pkProfileDialog->Rows(), m_kChoices, useLegs, result};
     m_kResultFile.clear();
     ShowTitle(m_kTitle);
     if (heedsShift) // one conversion, not one of many

@@ -103,7 +103,7 @@ void CGaitConvertContent::NotifyOfFindings(const std::string& path)
         return;
     CFileExam exam;
     exam.ExamineBVH(path);
-    m_kMendable = exam.Findings().MendsAny() ? path : "";
+    m_kNextSteps.SetMendable(exam.Findings().MendsAny() ? path : "");
     for (const Finding& finding : exam.Findings().Sorted())
     {
         if (finding.severity != ESeverity::Note && !IsOfReader(finding.reason))
@@ -114,15 +114,16 @@ void CGaitConvertContent::NotifyOfFindings(const std::string& path)
 // The copy is a new file next to the original.
 void CGaitConvertContent::OpenMendedCopy()
 {
-    if (m_kMendable.empty() || !ConfirmDiscard())
+    const std::string original = m_kNextSteps.Mendable();
+    if (original.empty() || !ConfirmDiscard())
         return;
-    const PathParts parts = SplitPath(m_kMendable);
+    const PathParts parts = SplitPath(original);
     const std::string copy = parts.folder + parts.stem + " (mended)";
     std::string path = copy + parts.extension;
     for (int number = 2; FileExists(path); ++number)
         path = copy + ' ' + std::to_string(number) + parts.extension;
     CFileExam exam;
-    exam.ExamineBVH(m_kMendable);
+    exam.ExamineBVH(original);
     CSafeFile::KeepExisting(path);
     if (exam.WriteMended(path))
     {

@@ -15,15 +15,16 @@ CGaitConvertContent::CLongStep::~CLongStep()
     content_.m_bProgressShown = false;
 }
 
-void CGaitConvertContent::ShowPercent(const char* verb, size_t done, size_t total)
+std::function<void(size_t, size_t)> CGaitConvertContent::ProgressOf(const char* verb)
 {
-    ShowProgress(verb, std::to_string(total > 0 ? 100 * done / total : 0) + " %");
+    return [this, verb](size_t done, size_t total) { ShowProgress(verb, done, total); };
 }
 
-void CGaitConvertContent::ShowProgress(const char* verb, const std::string& amount)
+void CGaitConvertContent::ShowProgress(const char* verb, size_t done, size_t total)
 {
     if (!window_.IsProgressDue())
         return;
+    const std::string amount = total > 0 ? std::to_string(100 * done / total) + " %" : "...";
     const std::string text = m_kTitle.empty() ? std::string(verb) + ' ' + amount : m_kTitle + ", " + amount;
     ShowTitle(m_bCancelable ? text + " (Esc cancels)" : text);
     m_bProgressShown = true;

@@ -28,6 +28,7 @@ int FrameOf(const CMotionView* view)
 // `driving` is what drove the result: the source, or its aligned copy.
 void CGaitConvertContent::StartMarks(CNode& driving)
 {
+    ClearMarks();
     const CKeyframeControl* const track = ConversionTrack(SourceRoot());
     if (!track || !m_kResultMotion.motionRoot)
         return;

@@ -1,40 +1,21 @@
-// What the window offers: the bone map that fits best, and remedies for notices.
+// The list of bone maps sorted by fit, and the remedies that the window offers.
 
 #include "CCntComboExControl.h"
 #include "CContentWindow.h"
 #include "CGaitConvertContent.h"
 #include "CProfileEditorDialog.h"
 #include "CSafeFile.h"
-#include "DoubtWords.h"
-#include "FindBodyByNames.h"
-#include "FindBone.h"
 #include "FindingWords.h"
 #include "NewProfilePath.h"
 #include "Paths.h"
 #include "StringTable.h"
 #include "SystemError.h"
-#include "Text.h"
-#include "UpAxis.h"
 
 #include <algorithm>
-#include <cmath>
 
 namespace gw {
 
 namespace {
-
-constexpr size_t kMissingShown = 3; // of the bones that a map names and the skeleton lacks
-
-// Returns the name of an axis that is not +Y: "Z", "-Z". A tilted one has the name of the closest axis.
-std::string AxisName(const Vec3& up)
-{
-    const double size[] = {std::fabs(up.x), std::fabs(up.y), std::fabs(up.z)};
-    const size_t axis = static_cast<size_t>(std::ranges::max_element(size) - size);
-    const float value = axis == 0 ? up.x : axis == 1 ? up.y : up.z;
-    std::string name(value < 0.0f ? "-" : "");
-    name += "XYZ"[axis];
-    return name == "Y" ? "" : name;
-}
 
 CFailureRecord PoseWarnings(const CFailureRecord& record)
 {
@@ -49,19 +30,6 @@ CFailureRecord PoseWarnings(const CFailureRecord& record)
 
 } // namespace
 
-// The rest pose does not always show the axis, so the motion is examined too.
-void CGaitConvertContent::FindUp()
-{
-    m_kUpAxis.clear();
-    CNode* const root = SourceRoot();
-    const SourceTiming timing = Timing();
-    if (!root || !(timing.frequency > 0.0f) || !(timing.lastFrame >= 0.0f))
-        return;
-    m_kUpAxis = AxisName(
-        FindUpAxis(FindBodyByNames(*root), timing.frequency, static_cast<int>(timing.lastFrame) + 1));
-    root->UpdateScene(0.0f, true);
-}
-
 // Alignment corrects what these notices are about.
 void CGaitConvertContent::NotifyOfPose()
 {
@@ -72,22 +40,18 @@ void CGaitConvertContent::NotifyOfPose()
 
 void CGaitConvertContent::NotifyOfUpAxis()
 {
-    if (!m_kUpAxis.empty() && !m_kChoices.align)
+    const std::string& up = m_kNextSteps.UpAxis();
+    if (!up.empty() && !m_kChoices.align)
         window_.Notify(MakeNotice(m_kSourcePath, "not-y-up",
-                                  "the motion's up axis is " + m_kUpAxis +
+                                  "the motion's up axis is " + up +
                                       ", so the result will lie or stand on its head (align the rest pose)",
                                   ESeverity::Warning));
 }
 
 void CGaitConvertContent::MeasureFits()
 {
-    CNode* const target = m_kBaseMotion.motionRoot.Get();
-    m_kFits = {};
-    if (SourceRoot() && target)
-    {
-        const std::string folders[] = {ExeFile({}), ProfileFile({})};
-        m_kFits.Measure(folders, *SourceRoot(), *target);
-    }
+    const std::string folders[] = {ExeFile({}), ProfileFile({})};
+    m_kNextSteps.MeasureFits(folders, SourceRoot(), m_kBaseMotion.motionRoot.Get());
     SortProfileList();
 }
 
@@ -104,13 +68,14 @@ void CGaitConvertContent::SortProfileList()
     std::vector<Item> items;
     for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
         items.push_back({*text, list.GetItemUserData(index), index == list.GetCurSel()});
-    std::ranges::stable_sort(items, {}, [this](const Item& item) { return m_kFits.RankOf(item.name); });
+    const CMapFits& fits = m_kNextSteps.Fits();
+    std::ranges::stable_sort(items, {}, [&](const Item& item) { return fits.RankOf(item.name); });
     list.DeleteItem(-1);
     for (const Item& item : items)
         list.AddItem(item.name, item.userData);
     for (int index = 0; const Item& item : items)
     {
-        list.SetItemWords(index, m_kFits.WordsOf(item.name), m_kFits.TipOf(item.name));
+        list.SetItemWords(index, fits.WordsOf(item.name), fits.TipOf(item.name));
         if (item.selected)
             list.SetCurSel(index);
         ++index;
@@ -126,7 +91,7 @@ std::string CGaitConvertContent::MapName() const
 
 void CGaitConvertContent::UseBestMap()
 {
-    const ProfileChoice* const best = m_kFits.Best();
+    const ProfileChoice* const best = m_kNextSteps.Fits().Best();
     if (!best)
         return;
     const std::string name = best->adapted ? SaveAdapted(*best) : best->profile.name;
@@ -189,47 +154,27 @@ void CGaitConvertContent::RunRemedy(ERemedy remedy)
 
 void CGaitConvertContent::TakeOffer()
 {
-    const Hint hint = ResultHint();
+    const Hint hint = m_kNextSteps.ResultHint(State());
     if (!hint.offers.empty())
         RunRemedy(hint.offers.front().remedy);
 }
 
 std::vector<Offer> CGaitConvertContent::OffersFor(std::span<const Notice> notices) const
 {
-    const auto has = [&](ERemedy remedy) {
-        return std::ranges::any_of(notices, [=](const Notice& n) { return RemedyOf(n.code) == remedy; });
-    };
-    std::vector<Offer> offers;
-    const ProfileChoice* const best = m_kFits.Best();
-    if (has(ERemedy::UseMap) && best && best->profile.name != MapName())
-        offers.push_back({ERemedy::UseMap, "Use " + Printable(best->profile.name)});
-    else if (has(ERemedy::UseMap) && SourceRoot())
-        offers.push_back({ERemedy::DraftMap, "Draft a bone map"});
-    if (has(ERemedy::AlignRestPose) && !m_kChoices.align)
-        offers.push_back({ERemedy::AlignRestPose, "Align the rest pose"});
-    const auto isOfMended = [this](const Notice& notice) { return notice.path == m_kMendable; };
-    if (!m_kMendable.empty() && std::ranges::any_of(notices, isOfMended))
-        offers.push_back({ERemedy::OpenMendedCopy, "Open a mended copy"});
-    return offers;
+    return m_kNextSteps.OffersFor(notices, State());
 }
 
-std::string CGaitConvertContent::SummaryOf(std::span<const Notice> notices) const
+StepState CGaitConvertContent::State() const
 {
-    const auto error = std::ranges::find_if_not(notices, &Notice::IsWarning);
-    if (error == notices.end())
-        return {};
-    std::string_view rest = error->words;
-    std::string summary;
-    size_t shown = 0;
-    size_t more = 0;
-    for (std::string_view line; NextLine(rest, line);)
-    {
-        if (shown <= kMissingShown)
-            summary.append(shown++ > 0 ? "\n" : "").append(line);
-        else
-            ++more;
-    }
-    return more == 0 ? summary : summary + "\n  and " + std::to_string(more) + " more";
+    static const CFailureRecord kNothing; // a container's reader warns of nothing that alignment mends
+    return {.source = SourceRoot(),
+            .target = m_kBaseMotion.motionRoot.Get(),
+            .hasFrames = m_bSourceIsContainer || m_kSourceMotion.GetKeyCount() > 0,
+            .readerRecord = m_bSourceIsContainer ? kNothing : m_kSourceMotion.Record(),
+            .mapName = m_kProfilePath.empty() ? std::string() : MapName(),
+            .rows = m_pkProfileDialog->Rows(),
+            .choices = m_kChoices,
+            .isConverted = m_kOrigin.has_value()};
 }
 
 } // namespace gw

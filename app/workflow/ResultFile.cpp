@@ -5,7 +5,6 @@
 #include "CByteSink.h"
 #include "CMotionFile.h"
 #include "CPackageFile.h"
-#include "CSafeFile.h"
 #include "Packaging.h"
 #include "Paths.h"
 
@@ -20,19 +19,6 @@ constexpr std::string_view kMotionExtension = ".htr";
 // The host plays packages at this rate; results are stored in half-steps of it.
 constexpr float kHostRate = 60.0f;
 
-// Returns a sink that also reports the number of bytes.
-CByteSink Watched(CByteSink sink, const SaveProgress& progress)
-{
-    if (!progress)
-        return sink;
-    return
-        [sink = std::move(sink), &progress, written = size_t{0}](std::span<const std::byte> bytes) mutable {
-            written += bytes.size();
-            progress(written);
-            return sink(bytes);
-        };
-}
-
 // Saves the result with rate / profileRate times as many frames.
 bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
                 const std::function<bool(float frameScale)>& save, CFailureRecord& record)
@@ -44,14 +30,12 @@ bool SaveMotion(const CMotionFile& result, float rate, int profileRate,
 }
 
 // The HTR text goes directly into the package, so an HTR file next to it is not touched.
-bool WritePackage(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record,
-                  const SaveProgress& progress)
+bool WritePackage(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
 {
     CPackageFile package;
-    const CByteSink store = [&](std::span<const std::byte> bytes) {
+    const CByteSink append = [&](std::span<const std::byte> bytes) {
         return package.Write(bytes) || record.Fail(package.Failure());
     };
-    const CByteSink append = Watched(store, progress);
     const auto write = [&](float frameScale) { return result.SaveText(append, frameScale); };
     if (!package.Open(
             path, {FormatCode(std::string(kMotionExtension)), static_cast<float>(profileRate), kHostRate}))
@@ -62,31 +46,18 @@ bool WritePackage(CMotionFile& result, const std::string& path, int profileRate,
 
 } // namespace
 
-bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record,
-                     const SaveProgress& progress)
+bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record)
 {
     if (HasExtension(path, kPackageExtension))
-        return WritePackage(result, path, profileRate, record, progress);
-    return WriteMotionFile(result, WithExtension(path, kMotionExtension), kSavedRate, profileRate, record,
-                           progress);
+        return WritePackage(result, path, profileRate, record);
+    return WriteMotionFile(result, WithExtension(path, kMotionExtension), kSavedRate, profileRate, record);
 }
 
 bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, int profileRate,
-                     CFailureRecord& record, const SaveProgress& progress)
+                     CFailureRecord& record)
 {
-    if (!progress)
-    {
-        const auto write = [&](float frameScale) { return result.Save(path, frameScale); };
-        return SaveMotion(result, rate, profileRate, write, record);
-    }
-    CSafeFile file;
-    if (!file.Open(path))
-        return record.Fail(file.Failure());
-    const CByteSink append =
-        Watched([&](std::span<const std::byte> bytes) { return file.Write(bytes); }, progress);
-    const auto write = [&](float frameScale) { return result.SaveText(append, frameScale); };
-    return SaveMotion(result, rate, profileRate, write, record) &&
-           (file.Commit() || record.Fail(file.Failure()));
+    const auto write = [&](float frameScale) { return result.Save(path, frameScale); };
+    return SaveMotion(result, rate, profileRate, write, record);
 }
 
 bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record)

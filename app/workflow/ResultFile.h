@@ -2,9 +2,7 @@
 
 #include "CFailureRecord.h"
 
-#include <cstddef>
 #include <cstdint>
-#include <functional>
 #include <string>
 #include <string_view>
 
@@ -37,18 +35,14 @@ enum class EBatchStep : uint8_t
 std::string_view BatchSource(EBatchJob job);
 std::string_view BatchResult(EBatchJob job);
 
-/// Called during writing with the number of bytes so far. It may throw to end the writing; an existing file
-/// then stays as it is.
-using SaveProgress = std::function<void(size_t bytes)>;
-
 // Each of these replaces an existing file. If nothing was written, it records the reason and returns false.
+// A result reports its progress, and if that ends the writing, an existing file stays as it is.
 
 /// Writes a result saved by a user: a package if the path ends in .Kinetra, otherwise an .htr with that name.
-bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record,
-                     const SaveProgress& progress = {});
+bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRate, CFailureRecord& record);
 /// Writes a result as HTR with rate / profileRate times as many frames.
 bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, int profileRate,
-                     CFailureRecord& record, const SaveProgress& progress = {});
+                     CFailureRecord& record);
 /// Packages an HTR file like a batch run.
 bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record);
 

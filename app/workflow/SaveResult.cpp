@@ -61,11 +61,7 @@ void CGaitConvertContent::ForgetFailedSave()
 bool CGaitConvertContent::WriteResult(const std::string& path)
 {
     m_kWriteRecord.Clear();
-    const SaveProgress progress = [this](size_t bytes) {
-        ShowProgress("Saving", std::to_string(bytes >> 20) + " MB");
-    };
-    const bool written =
-        WriteResultFile(m_kResultMotion, path, m_pkProfile->GetFrameRate(), m_kWriteRecord, progress);
+    const bool written = WriteResultFile(m_kResultMotion, path, m_pkProfile->GetFrameRate(), m_kWriteRecord);
     Notify(path, m_kWriteRecord);
     return written;
 }

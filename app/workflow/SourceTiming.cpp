@@ -7,6 +7,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <utility>
 #include <vector>
 
 namespace gw {
@@ -37,9 +38,11 @@ SourceTiming TimingOf(const CKeyframeControl* track)
 }
 
 // Reads into a separate scene, because a damaged file must not change the current one.
-bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record)
+bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record,
+                     std::function<void(size_t, size_t)> progress)
 {
     COrrinStream stream;
+    stream.SetProgress(std::move(progress));
     const bool read = stream.LoadFile(path, false);
     record = stream.Record();
     if (read && !record.Failure() && !PreviewTrack(FirstNode(stream.GetRoot(0))))

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <functional>
 #include <string>
 #include <string_view>
 
@@ -30,8 +31,10 @@ SourceTiming TimingOf(const CKeyframeControl* track);
 inline constexpr std::string_view kSceneExtension = ".orn";
 
 /// Reads a container with keys for a conversion. If it is damaged or has none, records the failure, leaves
-/// the scene unchanged and returns false.
-bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record);
+/// the scene unchanged and returns false. `progress` is called with the number of bytes read and the total;
+/// it may throw to end the reading, which leaves the scene unchanged too.
+bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record,
+                     std::function<void(size_t, size_t)> progress = {});
 
 /// Returns the first plain node under a container's root, or null.
 CNode* FirstNode(CObject* root);

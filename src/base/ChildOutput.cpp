@@ -58,13 +58,16 @@ pid_t Start(const std::string& program, const std::vector<std::string>& argument
     return -1;
 }
 
-bool WaitForBytes(int file, Clock::time_point end)
+bool WaitForBytes(int file, Clock::time_point end, const std::function<void()>& wait)
 {
+    constexpr int64_t kNap = 50; // milliseconds
     while (true)
     {
+        if (wait)
+            wait();
         const auto left = std::chrono::duration_cast<std::chrono::milliseconds>(end - Clock::now()).count();
         pollfd waiting{file, POLLIN, 0};
-        const int count = poll(&waiting, 1, static_cast<int>(std::clamp<int64_t>(left, 0, 60'000)));
+        const int count = poll(&waiting, 1, static_cast<int>(std::clamp<int64_t>(left, 0, kNap)));
         if (count > 0)
             return true;
         if ((count < 0 && errno != EINTR) || left <= 0)
@@ -73,12 +76,13 @@ bool WaitForBytes(int file, Clock::time_point end)
 }
 
 // Reads until the program closes its output. Returns Finished at that point.
-EChildEnd Collect(int file, const ChildLimits& limits, std::vector<std::byte>& output)
+EChildEnd Collect(int file, const ChildLimits& limits, std::vector<std::byte>& output,
+                  const std::function<void()>& wait)
 {
     const Clock::time_point end = Clock::now() + std::chrono::duration_cast<Clock::duration>(
                                                      std::chrono::duration<double>(limits.seconds));
     std::array<std::byte, 1 << 16> piece;
-    while (WaitForBytes(file, end))
+    while (WaitForBytes(file, end, wait))
     {
         const ssize_t count = read(file, piece.data(), piece.size());
         if (count == 0)
@@ -117,7 +121,8 @@ bool HasExited(pid_t process)
 } // namespace
 
 EChildEnd RunChild(const std::string& program, const std::vector<std::string>& arguments,
-                   const ChildLimits& limits, std::vector<std::byte>& output)
+                   const ChildLimits& limits, std::vector<std::byte>& output,
+                   const std::function<void()>& wait)
 {
     output.clear();
     int file = -1;
@@ -127,7 +132,7 @@ EChildEnd RunChild(const std::string& program, const std::vector<std::string>& a
     EChildEnd end = EChildEnd::Died;
     try
     {
-        end = Collect(file, limits, output);
+        end = Collect(file, limits, output, wait);
     } catch (...)
     {
         kill(process, SIGKILL);

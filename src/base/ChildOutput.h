@@ -2,6 +2,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <functional>
 #include <string>
 #include <vector>
 
@@ -24,8 +25,10 @@ enum class EChildEnd : uint8_t
 };
 
 /// Runs a program and collects what it writes to its standard output. Its standard input is empty, and what
-/// it writes to its standard error is discarded. The program gets none of this one's open files.
+/// it writes to its standard error is discarded. The program gets none of this one's open files. `wait` is
+/// called several times a second until it ends; if that throws, the program is killed.
 EChildEnd RunChild(const std::string& program, const std::vector<std::string>& arguments,
-                   const ChildLimits& limits, std::vector<std::byte>& output);
+                   const ChildLimits& limits, std::vector<std::byte>& output,
+                   const std::function<void()>& wait = {});
 
 } // namespace gw

@@ -217,7 +217,7 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
 
     reader.SetSource(m_pkFile);
     m_pkReader = &reader;
-    const bool whole = ReadObjects();
+    const bool whole = ReadObjects(bytes.size());
     m_pkReader = nullptr;
     if (whole)
         LinkObjects();
@@ -231,7 +231,7 @@ bool COrrinStream::LoadBuffer(std::span<const std::byte> bytes, size_t position)
     return sound;
 }
 
-bool COrrinStream::ReadObjects()
+bool COrrinStream::ReadObjects(size_t byteCount)
 {
     while (!m_pkReader->AtEnd() && !m_pkReader->IsDamaged())
     {
@@ -249,6 +249,8 @@ bool COrrinStream::ReadObjects()
         }
         if (marked)
             AddRoot(object);
+        if (progress_)
+            progress_(m_pkReader->Position(), byteCount);
     }
     return !m_pkReader->IsDamaged();
 }

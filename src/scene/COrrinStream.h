@@ -7,6 +7,7 @@
 #include "CVersion.h"
 
 #include <cstddef>
+#include <functional>
 #include <map>
 #include <memory>
 #include <optional>
@@ -92,6 +93,10 @@ public:
     /// Returns the failure of the last load or save, with byte position and class.
     const CFailureRecord& Record() const { return m_kRecord; }
 
+    /// Sets a function that a load calls for each object with the number of bytes read and the total. If it
+    /// throws, the stream can only be destroyed.
+    void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
+
     /// Limits the bytes that the linked pictures of each scene may take. 0 decodes no pictures and reports
     /// none.
     void SetPictureLimit(uint64_t bytes) { m_kLinkedPictures.m_uiByteLimit = bytes; }
@@ -124,7 +129,7 @@ public:
     void Warn(EFailure reason, std::string name) { m_kRecord.Warn(reason, 0, std::move(name)); }
 
 private:
-    bool ReadObjects();
+    bool ReadObjects(size_t byteCount);
     CObject* ReadNextObject(bool& marked);
     void LinkObjects();
     bool CheckGraph();
@@ -151,6 +156,7 @@ private:
     CFieldReader* m_pkReader = nullptr; // while reading
     CFieldWriter* m_pkWriter = nullptr; // while writing
     CFailureRecord m_kRecord;
+    std::function<void(size_t, size_t)> progress_;
 };
 
 /// Returns the factory of a concrete class.

@@ -6,6 +6,7 @@
 #include "Paths.h"
 
 #include <gmock/gmock.h>
+#include <thread>
 
 namespace gw {
 namespace {
@@ -48,28 +49,29 @@ protected:
 
 TEST_F(Offers, TheMapThatFitsIsOneStepAway)
 {
-    EXPECT_THAT(m_kContent.SourceHint().text, HasSubstr("Ctrl+O"));
+    m_kContent.UpdateControls();
+    EXPECT_THAT(m_kWindow.m_kHints["#cnt1"].text, HasSubstr("Ctrl+O"));
     Do("open other.bvh");
-    EXPECT_THAT(m_kContent.ResultHint().text, HasSubstr("Fits best"));
+    EXPECT_THAT(m_kWindow.m_kHints["#cnt2"].text, HasSubstr("Fits best"));
     EXPECT_EQ(*m_kWindow.m_kList.GetItemText(0), "Other");
     EXPECT_THAT(m_kWindow.m_kList.ItemWords(0), HasSubstr("best fit"));
     EXPECT_EQ(m_kWindow.m_kList.ItemWords(1), "") << "shares no bone with the source";
     m_kContent.TakeOffer();
     EXPECT_EQ(SelectedProfile(), "Other");
-    EXPECT_THAT(m_kContent.ResultHint().text, HasSubstr("Convert (Ctrl+Return)"));
+    EXPECT_THAT(m_kWindow.m_kHints["#cnt2"].text, HasSubstr("Convert (Ctrl+Return)"));
     Do("click convert");
     EXPECT_TRUE(m_kContent.IsConverted());
-    EXPECT_EQ(m_kContent.ResultHint().text, "");
+    EXPECT_EQ(m_kWindow.m_kHints["#cnt2"].text, "");
 }
 
 TEST_F(Offers, AFailedConversionIsSavedByTheMapThatFits)
 {
     Do("open walk.bvh, open other.bvh");
-    EXPECT_THAT(m_kContent.ResultHint().text, HasSubstr("Poser does not fit: "));
+    EXPECT_THAT(m_kWindow.m_kHints["#cnt2"].text, HasSubstr("Poser does not fit: "));
     m_kWindow.m_kNotices.clear();
     Do("click convert");
     EXPECT_EQ(RemediesOf(m_kContent.OffersFor(m_kWindow.m_kNotices)), std::vector{ERemedy::UseMap});
-    const std::string summary = m_kContent.SummaryOf(m_kWindow.m_kNotices);
+    const std::string summary = SummaryOf(m_kWindow.m_kNotices);
     EXPECT_EQ(std::ranges::count(summary, '\n'), 4) << summary; // three bones, and the number of others
     EXPECT_THAT(summary, HasSubstr("more"));
     m_kContent.RunRemedy(ERemedy::UseMap);
@@ -77,7 +79,7 @@ TEST_F(Offers, AFailedConversionIsSavedByTheMapThatFits)
 
     m_kWindow.m_kAnswers[139] = EAnswer::No;
     Do("open strange.bvh");
-    EXPECT_EQ(RemediesOf(m_kContent.ResultHint().offers), std::vector{ERemedy::DraftMap});
+    EXPECT_EQ(RemediesOf(m_kWindow.m_kHints["#cnt2"].offers), std::vector{ERemedy::DraftMap});
 }
 
 TEST_F(Offers, OnlyTheBonesOfTheChosenMapAreMarked)
@@ -131,6 +133,9 @@ TEST_F(Offers, ALongStepIsCanceledWithNothingHalfDone)
     m_kWindow.m_bCancel = true;
     Do("click convert");
     EXPECT_EQ(m_kContent.ResultMotion().motionRoot.Get(), result) << "the result before stays";
+    while (m_kContent.UpdateMarks())
+        std::this_thread::yield();
+    EXPECT_EQ(m_kWindow.m_iMarkedFrames, 5000) << "and so do its marks";
 }
 
 TEST_F(Offers, AFileThatReadsBadlyIsOpenedAsAMendedCopy)

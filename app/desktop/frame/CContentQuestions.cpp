@@ -3,6 +3,7 @@
 #include "CContent.h"
 #include "CGaitConvertContent.h"
 #include "CMessageBox.h"
+#include "CNextSteps.h"
 #include "CProfileEditorWindow.h"
 #include "CSelectFolderDialog.h"
 #include "DesktopServices.h"
@@ -38,7 +39,7 @@ EAnswer CContent::ShowMessageBox(int id, const std::string& text, EButtons butto
     BoxExtras extras;
     extras.details = Notes();
     if (id == kInvalidSourceMessage || id == kCannotConvertMessage)
-        extras.summary = m_pkLogic->SummaryOf(m_kNotices);
+        extras.summary = SummaryOf(m_kNotices);
     for (const Offer& offer : m_pkLogic->OffersFor(m_kNotices))
         extras.offers.push_back(offer.button);
     return AskWithOffers(Asker(id), text, buttons, extras);

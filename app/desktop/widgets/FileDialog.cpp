@@ -3,6 +3,8 @@
 #include "FileFilter.h"
 #include "QtText.h"
 
+#include <QDir>
+
 namespace gw {
 
 namespace {
@@ -22,6 +24,17 @@ QStringList NameFilters(const std::string& filter)
     return names;
 }
 
+void SelectFilter(QFileDialog& dialog, const std::string& path)
+{
+    const QString name = ToQString(path);
+    for (const QString& filter : dialog.nameFilters())
+    {
+        const QString patterns = filter.section(QLatin1Char('('), -1).chopped(1);
+        if (!path.empty() && QDir::match(patterns.split(QLatin1Char(' ')).join(QLatin1Char(';')), name))
+            return dialog.selectNameFilter(filter);
+    }
+}
+
 } // namespace
 
 std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode mode,
@@ -32,7 +45,8 @@ std::optional<std::string> RunFileDialog(QWidget& owner, QFileDialog::AcceptMode
     dialog.setAcceptMode(mode);
     dialog.setFileMode(mode == QFileDialog::AcceptOpen ? QFileDialog::ExistingFile : QFileDialog::AnyFile);
     dialog.setDefaultSuffix(ToQString(setup.defaultExtension));
-    dialog.setNameFilters(NameFilters(setup.filter));
+    dialog.setNameFilters(NameFilters(setup.filter) + NameFilters(setup.moreFilters));
+    SelectFilter(dialog, setup.openedLast);
     if (!setup.initialFolder.empty())
         dialog.setDirectory(ToQString(setup.initialFolder));
     if (!setup.fileName.empty())

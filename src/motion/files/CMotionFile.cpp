@@ -103,6 +103,7 @@ bool CMotionFile::Load(const std::string& path)
     {
         const auto stream = row->make();
         stream->boneMeshes = boneMeshes;
+        stream->progress_ = progress_;
         stream->lines.SetProgress(progress_);
         stream->importChoice = importChoice;
         const bool loaded = AnswerOf(stream->m_kRecord, [&] { return stream->Load(path); });
@@ -144,6 +145,7 @@ bool CMotionFile::SaveText(const CByteSink& sink, float frameScale)
 bool CMotionFile::SaveBy(const std::function<bool(TKHTRStream&)>& save)
 {
     TKHTRStream stream(*this);
+    stream.SetProgress(progress_);
     const bool saved = AnswerOf(stream.m_kRecord, [&] { return save(stream); });
     m_kRecord = stream.m_kRecord;
     return saved;

@@ -34,8 +34,9 @@ public:
     /// unchanged. For any other extension, returns true if a motion is already loaded, otherwise false. The
     /// tree is left at time 0.
     virtual bool Load(const std::string& path);
-    /// Sets a function that Load calls from time to time with the number of bytes read and the total. It may
-    /// throw to end the loading; the trees are then unchanged.
+    /// Sets a function that Load, Save and SaveText call from time to time with how much is done and the total,
+    /// or with a total of 0 if that is unknown. It may throw to end the step: then Load leaves the trees
+    /// unchanged, Save the file.
     void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
     /// Writes an HTR file with frameScale times as many frames. Returns false for other extensions and on
     /// failure.
@@ -71,6 +72,12 @@ protected:
 
     /// Returns false if the source was truncated during Load.
     virtual bool IsSourceWhole() const { return lines.IsWhole(); }
+
+    void Report(size_t done, size_t total) const
+    {
+        if (progress_)
+            progress_(done, total);
+    }
 
     CTextLines lines; ///< the text being read
     CFailureRecord m_kRecord;

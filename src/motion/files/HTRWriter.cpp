@@ -19,6 +19,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <functional>
 #include <limits>
 
 namespace gw {
@@ -79,9 +80,11 @@ std::vector<float> FrameTimes(int frameCount, float frequency, float frameScale)
 class CRows
 {
 public:
-    CRows(const TKHTRFile& file, CNode& motion, EQuarterTurns quarterTurns, std::vector<float> times)
+    /// `report` is called from time to time with the number of finished rows and their total.
+    CRows(const TKHTRFile& file, CNode& motion, EQuarterTurns quarterTurns, std::vector<float> times,
+          std::function<void(size_t, size_t)> report)
         : file_(file), m_eQuarterTurns(quarterTurns), m_kTimes(std::move(times)), m_kSampler(motion),
-          m_kNodeOfSegment(NodesOfSegments(file, m_kSampler.Nodes()))
+          m_kNodeOfSegment(NodesOfSegments(file, m_kSampler.Nodes())), report_(std::move(report))
     {
     }
 
@@ -98,6 +101,7 @@ public:
             m_kSampler.PoseTree(m_kTimes[frame]);
             for (size_t segment = 0; segment < file_.segments.size(); ++segment)
                 m_kWaiting[segment * m_kTimes.size() + frame] = PosedRow(segment);
+            Report(frame * file_.segments.size());
         }
         return true;
     }
@@ -111,7 +115,10 @@ public:
             return WriteSampled(out, segment, *track);
         CHTRRowText text;
         for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
+        {
             text.Write(out, NumberOf(frame), At(segment, frame));
+            ReportWritten(segment, frame);
+        }
     }
 
 private:
@@ -130,7 +137,21 @@ private:
                 text.Write(out, NumberOf(frame), RowOf(sampler.Local(), isRoot, base, m_eQuarterTurns));
             else
                 text.Repeat(out, NumberOf(frame));
+            ReportWritten(segment, frame);
         }
+    }
+
+    void ReportWritten(size_t segment, size_t frame) const
+    {
+        constexpr size_t kRowsBetween = 256;
+        const size_t posed = m_kWaiting.size(); // posing takes about as long as writing
+        if (frame % kRowsBetween == 0)
+            Report(posed + segment * m_kTimes.size() + frame);
+    }
+
+    void Report(size_t done) const
+    {
+        report_(done, m_kTimes.size() * file_.segments.size() + m_kWaiting.size());
     }
 
     HTRRow At(size_t segment, size_t frame)
@@ -157,6 +178,7 @@ private:
     CMotionSampler m_kSampler;
     std::vector<size_t> m_kNodeOfSegment;
     std::vector<HTRRow> m_kWaiting; // ordered by segment
+    std::function<void(size_t, size_t)> report_;
 };
 
 void Write(CLineWriter& out, const TKHTRFile& file, const HTRText& field)
@@ -283,7 +305,8 @@ bool TKHTRStream::SaveTo(const T& destination, float frameScale)
     AddSegments(*restRoot, "GLOBAL", file);
     SwitchControls(*motionRoot, true);
 
-    CRows rows(file, *motionRoot, quarterTurns, FrameTimes(file.numFrames, GetFrequency(), frameScale));
+    CRows rows(file, *motionRoot, quarterTurns, FrameTimes(file.numFrames, GetFrequency(), frameScale),
+               [this](size_t done, size_t total) { Report(done, total); });
     const bool written = WriteLines(destination, TextOf(file, rows, m_kRecord));
     motionRoot->UpdateScene(0.0f, true);
     return written;

@@ -26,6 +26,7 @@ constexpr int kNewestVersion = 721;
 constexpr float kFrequency = 0.06f;
 constexpr size_t kNameBytes = 256;
 constexpr std::string_view kFrameKeyword = "Frame";
+constexpr int kReportFrames = 64; // between two reports of progress
 constexpr size_t kPoseBytes = sizeof(Mat3) + sizeof(Vec3);
 
 } // namespace
@@ -120,7 +121,11 @@ void TKCHBStream::ReadMotion(TKCHFile& file)
         work.positions.reserve(std::min(asked, held));
     }
     for (int number = file.beginFrame; number < file.frameCount; ++number)
+    {
         ReadFrame(number);
+        if (number % kReportFrames == 0)
+            Report(m_uiPosition, m_kFile.Bytes().size());
+    }
     TakeFrames(file);
 }
 

@@ -123,7 +123,8 @@ bool TKImportStream::Run(const std::string& path, ImportedMotion& motion)
         arguments.push_back("--rate=" + std::to_string(importChoice.rate));
     arguments.push_back(PathArgument(path));
     std::vector<std::byte> output;
-    const EChildEnd end = RunChild(ExecutableFolder() + kProgram, arguments, kLimits, output);
+    const EChildEnd end =
+        RunChild(ExecutableFolder() + kProgram, arguments, kLimits, output, [this] { Report(0, 0); });
     if (end != EChildEnd::Finished)
         return m_kRecord.Fail(FailureOf(end));
     return ReadImported(output, motion) || m_kRecord.Fail(EFailure::ImportStopped);

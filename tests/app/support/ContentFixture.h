@@ -5,6 +5,7 @@
 #include "CGLView.h"
 #include "CGaitConvertContent.h"
 #include "CPlatform.h"
+#include "MotionMarks.h"
 #include "TempFolder.h"
 
 #include <array>
@@ -56,6 +57,8 @@ public:
     bool GetChildButtonState(std::string_view) const override { return m_bButtonState; }
     void SetChildScrollValue(std::string_view, int value) override { m_iScrollValue = value; }
     void SetChildText(std::string_view child, const std::string& text) override;
+    void ShowHint(std::string_view child, const Hint& hint) override { m_kHints[std::string(child)] = hint; }
+    void ShowMarks(const MotionMarks& marks) override { m_iMarkedFrames = marks.frameCount; }
     std::unique_ptr<CMotionView> CreateView(std::string_view child) override;
     CCntComboExControl& CreateComboEx(std::string_view, std::string_view, int) override { return m_kList; }
     void SetTimer(int id, int milliseconds) override;
@@ -101,6 +104,8 @@ public:
     bool m_bShowsFindings = false;
     FileDialogSetup m_kAsked;                    ///< of the last file or folder dialog
     std::map<std::string, std::string> m_kTexts; ///< last texts of children, by name
+    std::map<std::string, Hint> m_kHints;        ///< same for hints
+    int m_iMarkedFrames = 0;
 };
 
 /// Settings in memory, and folders data/ and docs/ in a temporary folder.
