@@ -8,9 +8,11 @@
 #include "CRetargeter.h"
 #include "CWaitCursor.h"
 #include "FindBone.h"
+#include "HostBones.h"
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "SourceTiming.h"
+#include "Text.h"
 #include "ToolStatus.h"
 
 #include <algorithm>
@@ -24,6 +26,9 @@ constexpr const char* kBaseFile = "base.htr";
 // One frame in sixty is saved, as the tool has always done; the user is told.
 constexpr float kSavedScale = 0.016667f;
 constexpr const char* kSavedNote = ", every sixtieth frame";
+constexpr const char* kPelvisNote =
+    "; the pelvis bones take a share of the legs' rotation, because the map has "
+    "no lines \"* LPelvis\" and \"* RPelvis\"";
 
 const FileDialogSetup kOpenMotion{"htr", "Anm Files (*.bvh;*.htr) |*.bvh;*.htr||", {}};
 const FileDialogSetup kSaveMotion{"htr", "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||", {}};
@@ -260,6 +265,19 @@ void CGaitToolDialog::Convert()
     ShowMotion(EToolMotion::Result);
     m_bConverted = true;
     m_kStatus = ConvertedWords(Motion(EToolMotion::Result), retargeter.Record());
+    if (IsPelvisFree(targets))
+        m_kStatus += kPelvisNote;
+}
+
+// Bone maps of the editor fix both pelvis bones; maps that are made here need not.
+bool CGaitToolDialog::IsPelvisFree(const CBoneNames& targets) const
+{
+    return std::ranges::any_of(kPelvisBones, [&](std::string_view bone) {
+        const auto fixes = [&](const MapLine& line) {
+            return line.kind == EMapLine::Fixed && EqualNoCase(line.target, bone);
+        };
+        return targets.Find(bone) && std::ranges::none_of(m_kMap.Lines(), fixes);
+    });
 }
 
 // A missing bone is null, which the retargeter treats as no bone.

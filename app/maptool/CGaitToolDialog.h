@@ -129,6 +129,7 @@ private:
     void TakeSkeletons();
     void MarkBones();
     bool IsMappable(const MapLine& line) const;
+    bool IsPelvisFree(const CBoneNames& targets) const;
     void ApplyLine(CRetargeter& retargeter, const MapLine& line, const CBoneNames& sources,
                    const CBoneNames& targets);
 

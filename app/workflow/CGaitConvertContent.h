@@ -267,6 +267,7 @@ private:
     // ProfileList.cpp
     void AddProfile(const std::string& path, int userData);
     void ChooseProfile();
+    void ForgetName(const std::string& name);
     void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);
     bool IsListed(const std::string& name) const;

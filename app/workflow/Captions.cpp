@@ -34,7 +34,7 @@ std::string SpeedWords(double speed)
         return ", plays at double speed";
     if (speed < 1.0)
         return ", plays at " + std::to_string(std::lround(100.0 * speed)) + " % speed";
-    return ", plays at " + Number(speed) + " times its speed";
+    return ", plays at " + Number(std::round(10.0 * speed) / 10.0) + " times its speed";
 }
 
 } // namespace

@@ -48,10 +48,12 @@ void CGaitConvertContent::ShowCaptions()
 std::string CGaitConvertContent::SourceNote() const
 {
     const std::string& up = m_kNextSteps.UpAxis();
-    std::string note = up.empty() ? "" : "Up axis: " + up;
+    std::string note;
     if (const size_t count = Clips().size(); count > 1)
-        note += (note.empty() ? "" : "; ") + ("clip " + Quoted(OpenClip())) + ", one of " +
-                std::to_string(count) + ": the options menu has the others";
+        note = "Clip " + Quoted(OpenClip()) + ", one of " + std::to_string(count) +
+               "; the options menu has the others";
+    if (!up.empty())
+        note += (note.empty() ? "Up axis: " : ". Up axis: ") + up;
     return note;
 }
 

@@ -112,9 +112,9 @@ TEST_F(ContentTest, DeletingAProfile)
     EXPECT_FALSE(m_kWindow.m_kEnabled["del"]);
 }
 
-TEST_F(ContentTest, ADeletedNameThatWasListedOnceIsFreeAgain)
+TEST_F(ContentTest, ADeletedNameIsFreeAgain)
 {
-    m_kWindow.m_kList.SetCurSel(2); // selecting it would list it a second time
+    SelectProfile("Mine"); // which lists it a second time
     m_kContent.ChildClick("del");
     m_kContent.ProfileEditor()->EditField(kNameField, "Mine");
     m_kContent.ProfileEditor()->LeaveField();

@@ -71,12 +71,12 @@ CEditorControls::CEditorControls(const CGaitConvertContent& content, QWidget* wi
 
 QLayout* CEditorControls::MakeFields()
 {
-    CFieldEdit* const name = MakeField(kNameField, QObject::tr("Profile Name:"));
+    CFieldEdit* const name = MakeField(kNameField, QObject::tr("Bone Map Name:"));
     CFieldEdit* const rate = MakeField(kFrameRateField, QObject::tr("Frame Rate:"));
     rate->setAlignment(Qt::AlignRight);
     rate->setFixedWidth(rate->fontMetrics().horizontalAdvance(QStringLiteral("000000000")));
     auto* const line = new QHBoxLayout;
-    line->addWidget(MakeLabel(QObject::tr("Profile Name:"), name));
+    line->addWidget(MakeLabel(QObject::tr("Bone Map Name:"), name));
     line->addWidget(name);
     line->addSpacing(name->fontMetrics().height());
     line->addWidget(MakeLabel(QObject::tr("Frame Rate:"), rate));

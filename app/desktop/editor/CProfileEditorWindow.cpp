@@ -47,7 +47,7 @@ CProfileEditorWindow::CProfileEditorWindow(CGaitConvertContent& content, CPlatfo
     : QDialog(owner), content_(content), platform_(platform), m_kControls(content, this)
 {
     setObjectName(QStringLiteral("profileEditor"));
-    setWindowTitle(tr("Profile Editor[*]"));
+    setWindowTitle(tr("Bone Map Editor[*]"));
     ConnectFields();
     ConnectTrees();
     ConnectRows();

@@ -11,6 +11,9 @@
 #include "SvgIcon.h"
 #include "Text.h"
 
+#include <QPointF>
+#include <QRegularExpression>
+#include <QSizeF>
 #include <algorithm>
 
 namespace gw {
@@ -35,6 +38,26 @@ constexpr std::string_view kNeededChildren[] = {
     "convert", "apply", "help",  "close",    "exit",    "play", "stop",    "back",     "end",
     "fback",   "fend",  "play1", "stop1",    "start1",  "end1", "PreFrm1", "NextFrm1",
 };
+
+constexpr int kIconSide = 20;
+constexpr double kSmallestScale = 0.5;
+
+// Scales all lengths of more than two pixels; thinner lines would vanish.
+QString ScaledStyle(const QString& style, double scale)
+{
+    static const QRegularExpression length(QStringLiteral("(\\d+)px"));
+    QString scaled;
+    qsizetype end = 0;
+    for (auto found = length.globalMatch(style); found.hasNext();)
+    {
+        const QRegularExpressionMatch match = found.next();
+        const int pixels = match.captured(1).toInt();
+        scaled += style.mid(end, match.capturedStart() - end) +
+                  QString::number(pixels > 2 ? qRound(scale * pixels) : pixels) + QStringLiteral("px");
+        end = match.capturedEnd();
+    }
+    return scaled + style.mid(end);
+}
 
 bool IsSide(int pixels)
 {
@@ -89,6 +112,28 @@ bool CSkin::Load(const std::string& folder, std::string& problem)
     m_kStyleSheet =
         ToQString(style).replace(QLatin1String("url(@/"), QLatin1String("url(") + ToQString(m_kFolder));
     return true;
+}
+
+void CSkin::ShrinkTo(const QSize& screen)
+{
+    const double fit = std::min(static_cast<double>(screen.width()) / m_kSize.width(),
+                                static_cast<double>(screen.height()) / m_kSize.height());
+    if (!(fit < 1.0))
+        return;
+    m_dScale = std::max(fit, kSmallestScale);
+    m_kStyleSheet = ScaledStyle(m_kStyleSheet, m_dScale);
+    for (SkinChild& child : m_kChildren)
+    {
+        const QPointF corner = QPointF(child.place.topLeft()) * m_dScale;
+        child.place = QRect(corner.toPoint(), (QSizeF(child.place.size()) * m_dScale).toSize());
+        child.place.setSize(child.place.size().expandedTo({1, 1}));
+    }
+    m_kSize = (QSizeF(m_kSize) * m_dScale).toSize();
+}
+
+int CSkin::IconSide() const
+{
+    return qRound(kIconSide * m_dScale);
 }
 
 bool CSkin::ReadFile(const char* name, std::string& text, std::string& problem) const

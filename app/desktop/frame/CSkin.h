@@ -15,7 +15,7 @@ struct SkinChild
 {
     std::string kind;
     std::string name; ///< starts with "#" for displays, "|" for scroll bars, "%" for two-state buttons
-    QRect place;      ///< pixels at scale 1
+    QRect place;      ///< pixels, already shrunk
     std::string icon; ///< name of a picture, or empty
     std::string secondIcon;
 };
@@ -28,6 +28,9 @@ public:
     /// Loads a skin. Returns false, with a description of the problem, if the folder has no complete skin.
     bool Load(const std::string& folder, std::string& problem);
 
+    /// Makes everything smaller if the window would not fit on a screen with this size, but at most by half.
+    void ShrinkTo(const QSize& screen);
+
     QSize Size() const { return m_kSize; }
     const std::vector<SkinChild>& Children() const { return m_kChildren; }
     const QString& StyleSheet() const { return m_kStyleSheet; }
@@ -36,6 +39,8 @@ public:
     QString Text(std::string_view child, std::string_view aspect = {}) const;
     /// Returns an icon, sharp at every scale and dimmed if disabled; empty for an empty name.
     QIcon Icon(const std::string& name) const;
+    /// Returns the side of the icons in buttons.
+    int IconSide() const;
 
 private:
     bool ReadFile(const char* name, std::string& text, std::string& problem) const;
@@ -47,6 +52,7 @@ private:
     std::string m_kTexts;
     QString m_kStyleSheet;
     QSize m_kSize;
+    double m_dScale = 1.0;
     std::vector<SkinChild> m_kChildren;
 };
 

@@ -19,8 +19,6 @@ namespace gw {
 
 namespace {
 
-constexpr QSize kIconSize(20, 20);
-
 class CPicture : public QWidget
 {
 public:
@@ -116,7 +114,7 @@ CFaceButton::CFaceButton(const SkinChild& child, const CSkin& skin, QWidget* fac
     const QString text = skin.Text(child.name);
     setText(text.isEmpty() || child.icon.empty() ? text : QLatin1Char(' ') + text);
     setCheckable(child.kind == "toggle");
-    setIconSize(kIconSize);
+    setIconSize(QSize(skin.IconSide(), skin.IconSide()));
     SetFace(0);
 }
 

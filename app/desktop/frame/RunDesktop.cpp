@@ -19,6 +19,7 @@
 
 #include <QApplication>
 #include <QLocale>
+#include <QScreen>
 #include <QStyleFactory>
 #include <QTimer>
 #include <cstdio>
@@ -48,9 +49,12 @@ void Complain(const std::string& words)
 bool LoadSkin(CSkin& skin, const CPlatform& platform, std::string& problem)
 {
     const bool loaded = skin.Load(platform.DataFolder() + kSkinFolder, problem);
-    if (loaded)
-        qApp->setStyleSheet(skin.StyleSheet());
-    return loaded;
+    if (!loaded)
+        return false;
+    if (const QScreen* screen = QGuiApplication::primaryScreen())
+        skin.ShrinkTo(screen->availableSize());
+    qApp->setStyleSheet(skin.StyleSheet());
+    return true;
 }
 
 void CheckTarget(const CPlatform& platform)

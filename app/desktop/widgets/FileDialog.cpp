@@ -4,6 +4,7 @@
 #include "QtText.h"
 
 #include <QDir>
+#include <QFileInfo>
 
 namespace gw {
 
@@ -26,7 +27,7 @@ QStringList NameFilters(const std::string& filter)
 
 void SelectFilter(QFileDialog& dialog, const std::string& path)
 {
-    const QString name = ToQString(path);
+    const QString name = QFileInfo(ToQString(path)).fileName();
     for (const QString& filter : dialog.nameFilters())
     {
         const QString patterns = filter.section(QLatin1Char('('), -1).chopped(1);
