@@ -42,7 +42,8 @@ constexpr std::string_view kNeededChildren[] = {
 constexpr int kIconSide = 20;
 constexpr double kSmallestScale = 0.5;
 
-// Scales all lengths of more than two pixels; thinner lines would vanish.
+// Scales all lengths of more than two pixels, because thinner lines would vanish. Rounding down keeps radii
+// within half the sides; the toolkit does not round corners otherwise.
 QString ScaledStyle(const QString& style, double scale)
 {
     static const QRegularExpression length(QStringLiteral("(\\d+)px"));
@@ -53,7 +54,8 @@ QString ScaledStyle(const QString& style, double scale)
         const QRegularExpressionMatch match = found.next();
         const int pixels = match.captured(1).toInt();
         scaled += style.mid(end, match.capturedStart() - end) +
-                  QString::number(pixels > 2 ? qRound(scale * pixels) : pixels) + QStringLiteral("px");
+                  QString::number(pixels > 2 ? static_cast<int>(scale * pixels) : pixels) +
+                  QStringLiteral("px");
         end = match.capturedEnd();
     }
     return scaled + style.mid(end);
