@@ -253,6 +253,8 @@ TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
     EXPECT_EQ(shown(), none + QStringLiteral(": faithful"));
     ChooseOption(person, 0);
     EXPECT_EQ(shown(), none + QStringLiteral(": aligned, faithful"));
+    ChooseOption(person, 2);
+    EXPECT_EQ(shown(), none + QStringLiteral(": aligned, faithful (hands free)"));
     ChooseOption(person, 1);
     EXPECT_EQ(shown(), none + QStringLiteral(": aligned"));
     person.Restart();
@@ -261,7 +263,7 @@ TEST(MainWindow, OptionsAreOffUntilChosenAndShowWhenTheyAreOn)
 
 TEST(MainWindow, ABoneMapIsDraftedForASourceThatNoneFits)
 {
-    constexpr int kDraft = 3; // after the separator
+    constexpr int kDraft = 4; // after the separator
     CPerson person;
     person.Drop(NamelessWalk(person.Home().Path()));
     person.Click("convert");
