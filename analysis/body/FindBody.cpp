@@ -4,6 +4,9 @@
 #include "CJointTree.h"
 #include "FindBodyByNames.h"
 #include "FindBodyByShape.h"
+#include "NumberedChains.h"
+
+#include <utility>
 
 namespace gw {
 
@@ -27,6 +30,17 @@ void AddMissing(CBodyMap& body, const CBodyMap& other)
     }
 }
 
+// Where no pose shows which side is left, the names decide. Returns whether they do.
+bool SortSidesByNames(int sides, CBodyMap& body)
+{
+    if (sides < 0)
+    {
+        std::swap(body.arms[0], body.arms[1]);
+        std::swap(body.legs[0], body.legs[1]);
+    }
+    return sides != 0;
+}
+
 EBodyEvidence EvidenceOf(const CNode* joint, const CNode* named, const CNode* shaped)
 {
     if (!joint)
@@ -43,14 +57,21 @@ FoundBody FindBody(CNode& root)
     const CJointTree tree(root);
     const CBodyMap named = FindBodyByNames(root);
     bool sidesAreSure = false;
-    const CBodyMap shaped = FindBodyByShape(tree, sidesAreSure);
+    CBodyMap shaped = FindBodyByShape(tree, sidesAreSure);
 
     FoundBody found;
     found.body = named;
     found.doubts = CheckBody(named, tree);
+    NumberedChains chains;
     const bool namesAreGood = named.DrivesBody() && found.doubts.empty();
     if (!namesAreGood && shaped.DrivesBody())
     {
+        chains = FindNumberedChains(root, shaped);
+        if (!sidesAreSure && SortSidesByNames(chains.sides, shaped))
+        {
+            sidesAreSure = true;
+            chains = FindNumberedChains(root, shaped);
+        }
         found.body = shaped;
         found.doubts = CheckBody(shaped, tree);
         found.sidesAreSure = sidesAreSure;
@@ -59,8 +80,10 @@ FoundBody FindBody(CNode& root)
     for (size_t i = 0; i < kBodyPlaceCount; ++i)
     {
         const BodyPlace place = BodyPlaces()[i];
-        found.evidence[i] =
-            EvidenceOf(JointAt(found.body, place), JointAt(named, place), JointAt(shaped, place));
+        const CNode* const shapedJoint = JointAt(shaped, place);
+        found.evidence[i] = chains.agrees[i]
+                                ? EBodyEvidence::Both
+                                : EvidenceOf(JointAt(found.body, place), JointAt(named, place), shapedJoint);
     }
     return found;
 }

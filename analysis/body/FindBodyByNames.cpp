@@ -5,8 +5,7 @@
 #include "FindBodyByNames.h"
 
 #include "BodyTree.h"
-#include "JointWords.h"
-#include "NamePrefix.h"
+#include "JointNames.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -52,19 +51,14 @@ private:
 CNamedJoints::CNamedJoints(CNode& root)
 {
     const std::vector<CNode*> nodes = NodesOf(root);
-    std::vector<std::string_view> names;
-    names.reserve(nodes.size());
-    for (const CNode* node : nodes)
-        names.push_back(WithoutNamespace(node->NameView()));
-    const std::string prefix = FindNamePrefix(names);
+    const std::vector<JointName> names = ReadJointNames(nodes);
     std::unordered_map<const CNode*, size_t> depths; // parents precede their children
     for (size_t i = 0; i < nodes.size(); ++i)
     {
         const auto parent = depths.find(nodes[i]->GetParentNode());
         const size_t depth = depths[nodes[i]] = parent == depths.end() ? 0 : parent->second + 1;
-        const JointName name = ReadJointName(WithoutPrefix(names[i], prefix));
-        if (name.word != EJointWord::None)
-            Add({nodes[i], name, depth});
+        if (names[i].word != EJointWord::None)
+            Add({nodes[i], names[i], depth});
     }
 }
 

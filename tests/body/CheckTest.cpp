@@ -156,6 +156,77 @@ TEST(FindBody, SaysWhenNoPoseShowsTheSides)
     EXPECT_FALSE(found.sidesAreSure);
 }
 
+// A name such as "arm_L_2" does not say which joint of the arm it is, but it agrees with a forearm.
+TEST(FindBody, NumberedChainsAgreeWithTheShape)
+{
+    constexpr const char* kArms = "arm_joint_+_1 arm_joint_+_2 arm_joint_+_3 arm_joint_+_4";
+    constexpr const char* kLegs = "- leg_joint_+_1 leg_joint_+_2 leg_joint_+_3 leg_joint_+_5";
+    const std::tuple<const char*, const char*, const char*, bool> rows[] = {
+        {"numbered outward", kArms, kLegs, true},
+        {"the first without a number", "Arm.+ Arm.+.001 Arm.+.002 Arm.+.003",
+         "- Leg.+ Leg.+.001 Leg.+.002 Leg.+.003", true},
+        {"numbered inward, with a named foot", "Clav_+ *Arm__3_ *Arm__2_ *Hand", "- Leg2+ Leg1+ Foot+ Toe+",
+         true},
+        {"no numbers in order", "arm_+_2 arm_+_4 arm_+_1 arm_+_3", "- leg_+_1 leg_+_3 leg_+_2 toe_+", false},
+        {"other limbs", "leg_+_1 leg_+_2 leg_+_3 leg_+_4", "- arm_+_1 arm_+_2 arm_+_3 arm_+_4", false},
+        {"no limb", "chain_+_1 chain_+_2 chain_+_3 chain_+_4", "- rope_+_1 rope_+_2 rope_+_3 rope_+_4",
+         false},
+    };
+    for (const auto& [what, arm, leg, agrees] : rows)
+    {
+        SCOPED_TRACE(what);
+        const Convention names{what, "Left Right", "torso_1 torso_2 torso_3 torso_4", "Neck Head", arm, leg};
+        const CNamedBody named(names, {"as it is"});
+        const FoundBody found = FindBody(named.Root());
+        for (const EBodySide side : {Left, Right})
+        {
+            for (const EBodyJoint joint : {EBodyJoint::Forearm, EBodyJoint::Hand, EBodyJoint::Shin})
+                EXPECT_EQ(found.Evidence({joint, side}) == EBodyEvidence::Both, agrees);
+            EXPECT_EQ(found.body.Leg(side).shin, named.Body().Leg(side).shin);
+        }
+        EXPECT_EQ(found.Evidence({EBodyJoint::Hip}), EBodyEvidence::Both);
+    }
+}
+
+// Joints of all limbs as "arm_L_1" and so on, from the upper arm or thigh to the end.
+void NumberLimbs(const CBodyMap& body, const char* sides)
+{
+    for (const EBodySide side : {Left, Right})
+    {
+        for (const bool isArm : {true, false})
+        {
+            int number = 0;
+            CNode* joint = isArm ? body.Arm(side).upperArm : body.Leg(side).thigh;
+            const std::string stem = std::string(isArm ? "arm_" : "leg_") + sides[side == Left ? 0 : 1] + '_';
+            for (; joint; joint = FirstChild(*joint))
+                joint->SetName((stem + std::to_string(++number)).c_str());
+        }
+    }
+}
+
+// Between elbow and wrist, a joint that twists has a number too.
+TEST(FindBody, AJointThatTheShapeLeavesOutBreaksAChain)
+{
+    const CMadeSkeleton made("twist", 1);
+    NumberLimbs(made.Body(), "LR");
+    const FoundBody found = FindBody(made.Root());
+    EXPECT_EQ(found.body.Arm(Left).forearm, made.Body().Arm(Left).forearm);
+    EXPECT_NE(found.Evidence({EBodyJoint::Forearm, Left}), EBodyEvidence::Both);
+}
+
+TEST(FindBody, NamesShowTheSidesThatNoPoseShows)
+{
+    for (const char* sides : {"LR", "RL"})
+    {
+        const CMadeSkeleton made("notoes bare", 1);
+        NumberLimbs(made.Body(), sides);
+        const FoundBody found = FindBody(made.Root());
+        EXPECT_TRUE(found.sidesAreSure);
+        EXPECT_EQ(found.body.Arm(Left).hand->NameView(), "arm_L_3");
+        EXPECT_EQ(found.Evidence({EBodyJoint::Shin, Right}), EBodyEvidence::Both);
+    }
+}
+
 TEST(FindBody, LeavesThePoseAsItWas)
 {
     const CMadeSkeleton made("walk", 1);
