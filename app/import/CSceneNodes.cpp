@@ -26,17 +26,30 @@ CSceneNodes::CSceneNodes(const aiScene& scene) : scene_(scene)
         for (unsigned i = node->mNumChildren; i-- > 0;)
             waiting.emplace_back(node->mChildren[i], index);
     }
-    for (size_t i = 0; i < m_kNodes.size(); ++i)
-        m_kIndexOfName.emplace(m_kNodes[i].name, i);
     MarkEnds();
-    MarkHelpers();
+    ListNames();
     MarkThings();
+    ListNames(); // again, now that it is known what is a thing
+    MarkHelpers();
 }
 
 void CSceneNodes::Add(const aiNode& node, size_t parent)
 {
     m_kNodes.push_back({.node = &node, .parent = parent, .name = node.mName.C_Str()});
     m_kNodes.back().isThing = node.mNumMeshes > 0;
+}
+
+void CSceneNodes::ListNames()
+{
+    m_kIndexOfName.clear();
+    for (const bool areThings : {false, true})
+    {
+        for (size_t i = 0; i < m_kNodes.size(); ++i)
+        {
+            if (m_kNodes[i].isThing == areThings)
+                m_kIndexOfName.emplace(m_kNodes[i].name, i);
+        }
+    }
 }
 
 void CSceneNodes::MarkEnds()
@@ -76,6 +89,12 @@ size_t CSceneNodes::Find(std::string_view name) const
 {
     const auto found = m_kIndexOfName.find(name);
     return found == m_kIndexOfName.end() ? kNone : found->second;
+}
+
+bool CSceneNodes::IsShared(std::string_view name) const
+{
+    const auto hasName = [&](const Node& node) { return !node.isThing && node.name == name; };
+    return std::ranges::count_if(m_kNodes, hasName) > 1;
 }
 
 std::vector<SceneMatrix> CSceneNodes::WorldOf(const std::vector<SceneMatrix>& locals) const

@@ -35,8 +35,11 @@ public:
     const aiScene& Scene() const { return scene_; }
     size_t Count() const { return m_kNodes.size(); }
     const Node& operator[](size_t index) const { return m_kNodes[index]; }
-    /// Returns the first node with a name, or kNone.
+    /// Returns the first node with a name, or kNone. Meshes, cameras and lights come last: a mesh is often
+    /// called like the joint that moves it.
     size_t Find(std::string_view name) const;
+    /// Returns whether several nodes other than things have a name.
+    bool IsShared(std::string_view name) const;
     /// Returns the world matrices of all nodes from their local ones.
     std::vector<SceneMatrix> WorldOf(const std::vector<SceneMatrix>& locals) const;
     /// Returns the local matrices that the file gives its nodes.
@@ -47,6 +50,7 @@ private:
     void MarkEnds();
     void MarkHelpers();
     void MarkThings();
+    void ListNames();
 
     const aiScene& scene_;
     std::vector<Node> m_kNodes;

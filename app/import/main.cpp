@@ -3,6 +3,7 @@
 // had faults, so the process gives up everything it does not need before it opens the file. It never fails by
 // itself: what went wrong is part of the message.
 
+#include "CModelFiles.h"
 #include "CSceneNodes.h"
 #include "ImportedMotion.h"
 #include "Paths.h"
@@ -21,6 +22,7 @@
 #include <numbers>
 #include <string>
 #include <string_view>
+#include <unordered_set>
 
 namespace gw {
 
@@ -117,6 +119,19 @@ void Refuse(ImportedMotion& motion, EImport outcome, std::string words = {})
     motion.words = std::move(words);
 }
 
+// The library says by its name which node a channel moves. Returns a name for which that is not enough.
+std::string SharedName(const CSceneNodes& nodes, const aiAnimation* clip)
+{
+    std::unordered_set<std::string_view> names;
+    for (unsigned i = 0; clip && i < clip->mNumChannels; ++i)
+    {
+        const std::string_view name = clip->mChannels[i]->mNodeName.C_Str();
+        if (!names.insert(name).second && nodes.IsShared(name))
+            return std::string(name);
+    }
+    return {};
+}
+
 void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
 {
     const CSceneNodes nodes(scene);
@@ -126,6 +141,8 @@ void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
         return Refuse(motion, EImport::NoClip, order.clip);
     if (skeleton.nodes.empty())
         return Refuse(motion, EImport::NoSkeleton);
+    if (const std::string name = SharedName(nodes, animation); !name.empty())
+        return Refuse(motion, EImport::Refused, "it moves several nodes that are all called " + name);
     const SceneClip clip = PlanClip(nodes, animation, order.rate);
     if (!(clip.frames * static_cast<double>(skeleton.nodes.size()) < kMostKeys))
         return Refuse(motion, EImport::TooLarge);
@@ -137,6 +154,16 @@ void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
     SampleJoints(nodes, skeleton, clip, upright, motion);
 }
 
+// The library's own words for a file that is of no format repeat its path.
+std::string WhyNotRead(const Assimp::Importer& importer, const CModelFiles& files)
+{
+    const std::string_view words = importer.GetErrorString();
+    if (!files.WhyNot().empty())
+        return files.WhyNot();
+    return words.starts_with("No suitable reader") ? "it is not of the format that its name says"
+                                                   : std::string(words);
+}
+
 ImportedMotion Import(const Order& order)
 {
     ImportedMotion motion;
@@ -144,11 +171,13 @@ ImportedMotion Import(const Order& order)
     importer.SetPropertyBool(AI_CONFIG_IMPORT_REMOVE_EMPTY_BONES, false);
     importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_TEXTURES, false);
     importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_MATERIALS, false);
-    const aiScene* const scene = importer.ReadFile(order.path, 0);
+    auto* const files = new CModelFiles(order.path);
+    importer.SetIOHandler(files); // and owns it
+    const aiScene* const scene = importer.ReadFile(files->ModelName(), 0);
     if (scene && scene->mRootNode)
         ReadScene(*scene, order, motion);
     else
-        Refuse(motion, EImport::Refused, importer.GetErrorString());
+        Refuse(motion, EImport::Refused, WhyNotRead(importer, *files));
     return motion;
 }
 
