@@ -75,6 +75,11 @@ CModelFiles::CModelFiles(const std::string& model)
 {
 }
 
+bool CModelFiles::IsCollada() const
+{
+    return HasExtension(m_kModel, ".dae");
+}
+
 fs::path CModelFiles::PathOf(std::string_view file) const
 {
     if (file == m_kModelName)

@@ -18,6 +18,7 @@ public:
     /// Returns the name under which the library must open the model. It chooses its reader by the extension,
     /// and does not know all of them.
     const std::string& ModelName() const { return m_kModelName; }
+    bool IsCollada() const;
     /// Returns why the first file that could not be opened could not; empty if there was none.
     const std::string& WhyNot() const { return m_kWhyNot; }
 

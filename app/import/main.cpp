@@ -3,17 +3,13 @@
 // had faults, so the process gives up everything it does not need before it opens the file. It never fails by
 // itself: what went wrong is part of the message.
 
-#include "CModelFiles.h"
+#include "CModelReader.h"
 #include "CSceneNodes.h"
 #include "ImportedMotion.h"
-#include "Paths.h"
 #include "Sandbox.h"
 #include "ScenePoses.h"
 #include "SceneSkeleton.h"
 #include "Text.h"
-
-#include <assimp/Importer.hpp>
-#include <assimp/config.h>
 
 #include <algorithm>
 #include <cstdio>
@@ -88,12 +84,13 @@ T Fact(const aiScene& scene, const char* name, T fallback)
     return scene.mMetaData && scene.mMetaData->Get(name, value) ? value : fallback;
 }
 
-double UnitMeters(const aiScene& scene, const std::string& path)
+// A unit of an FBX file is some number of centimeters. The other formats are in meters; the library applies
+// the unit of a Collada file itself.
+double UnitMeters(const aiScene& scene)
 {
     constexpr double kCentimeter = 0.01;
-    if (scene.mMetaData && scene.mMetaData->HasKey("UnitScaleFactor"))
-        return kCentimeter * Fact(scene, "UnitScaleFactor", 1.0);
-    return HasExtension(path, ".dae") ? 0.0 : 1.0; // glTF is in meters
+    const bool isFBX = scene.mMetaData && scene.mMetaData->HasKey("UnitScaleFactor");
+    return isFBX ? kCentimeter * Fact(scene, "UnitScaleFactor", 1.0) : 1.0;
 }
 
 // The rotation that turns the file's up axis to Y, if the library has not applied it to the root itself.
@@ -148,36 +145,20 @@ void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
         return Refuse(motion, EImport::TooLarge);
     motion.rate = clip.rate;
     motion.isRateOfFile = clip.isRateOfFile;
-    motion.unitMeters = UnitMeters(scene, order.path);
+    motion.unitMeters = UnitMeters(scene);
     motion.frameCount = static_cast<uint32_t>(clip.frames);
     const SceneMatrix upright = Upright(scene, motion.wasTurnedUp);
     SampleJoints(nodes, skeleton, clip, upright, motion);
 }
 
-// The library's own words for a file that is of no format repeat its path.
-std::string WhyNotRead(const Assimp::Importer& importer, const CModelFiles& files)
-{
-    const std::string_view words = importer.GetErrorString();
-    if (!files.WhyNot().empty())
-        return files.WhyNot();
-    return words.starts_with("No suitable reader") ? "it is not of the format that its name says"
-                                                   : std::string(words);
-}
-
 ImportedMotion Import(const Order& order)
 {
     ImportedMotion motion;
-    Assimp::Importer importer;
-    importer.SetPropertyBool(AI_CONFIG_IMPORT_REMOVE_EMPTY_BONES, false);
-    importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_TEXTURES, false);
-    importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_READ_MATERIALS, false);
-    auto* const files = new CModelFiles(order.path);
-    importer.SetIOHandler(files); // and owns it
-    const aiScene* const scene = importer.ReadFile(files->ModelName(), 0);
-    if (scene && scene->mRootNode)
+    CModelReader reader(order.path);
+    if (const aiScene* const scene = reader.Read())
         ReadScene(*scene, order, motion);
     else
-        Refuse(motion, EImport::Refused, WhyNotRead(importer, *files));
+        Refuse(motion, EImport::Refused, reader.WhyNot());
     return motion;
 }
 
