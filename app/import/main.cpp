@@ -90,7 +90,7 @@ double UnitMeters(const aiScene& scene)
 {
     constexpr double kCentimeter = 0.01;
     const bool isFBX = scene.mMetaData && scene.mMetaData->HasKey("UnitScaleFactor");
-    return isFBX ? kCentimeter * Fact(scene, "UnitScaleFactor", 1.0) : 1.0;
+    return isFBX ? kCentimeter * Fact(scene, "UnitScaleFactor", 1.0f) : 1.0;
 }
 
 // The rotation that turns the file's up axis to Y, if the library has not applied it to the root itself.

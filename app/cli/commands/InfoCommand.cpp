@@ -8,6 +8,7 @@
 #include "FindingWords.h"
 #include "InfoContainer.h"
 #include "JsonStatus.h"
+#include "MotionFacts.h"
 #include "NoticeJson.h"
 #include "PackageBlocks.h"
 #include "PackagedMotion.h"
@@ -101,6 +102,31 @@ void PrintClips(const ImportFacts& facts)
         std::printf("clip:    %s%s\n", Printable(clip).c_str(), clip == facts.clip ? " (shown)" : "");
 }
 
+// What only the files of modeling programs say.
+void PrintSpace(const ImportFacts& facts, const Timing& timing)
+{
+    if (facts.unitMeters <= 0.0)
+        return;
+    const std::string unit(UnitOfMeters(facts.unitMeters));
+    if (unit.empty())
+        std::printf("unit:    %g metres\n", facts.unitMeters);
+    else
+        std::printf("unit:    %s\n", unit.c_str());
+    if (facts.wasTurnedUp)
+        std::puts("up:      turned to Y");
+    if (!facts.isRateOfFile && timing.frames > 1)
+        std::puts("sampled: at a chosen rate, because the file has none (see --rate)");
+}
+
+void WriteSpace(CJsonWriter& json, const ImportFacts& facts)
+{
+    if (facts.unitMeters <= 0.0)
+        return;
+    json.Key("unitMeters").Number(static_cast<float>(facts.unitMeters));
+    json.Key("turnedUp").Bool(facts.wasTurnedUp);
+    json.Key("rateOfFile").Bool(facts.isRateOfFile);
+}
+
 void WriteClips(CJsonWriter& json, const ImportFacts& facts)
 {
     json.Key("clips").BeginArray();
@@ -123,6 +149,7 @@ void Print(const std::string& path, CSceneFile& file)
         PrintContainer(file.Scene());
     const Timing timing = TrackTiming(file.FirstTrack());
     PrintClips(file.Motion().imported);
+    PrintSpace(file.Motion().imported, timing);
     if (!file.IsScene() || timing.frames != 0)
         PrintTiming(timing);
     if (const int count = SourceShare(file); count > 1)
@@ -147,6 +174,7 @@ void WriteJson(const std::string& path, CSceneFile& file)
     json.Key("framesPerSourceFrame").Integer(SourceShare(file));
     WriteBones(json, file.Nodes());
     WriteClips(json, file.Motion().imported);
+    WriteSpace(json, file.Motion().imported);
     WriteRecord(json, path, file.Record());
     if (file.IsContainer())
         WriteContainer(json, file.Scene());
