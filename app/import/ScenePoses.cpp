@@ -21,7 +21,7 @@ using Vector = aiVector3t<double>;
 using Rotation = aiMatrix3x3t<double>;
 
 constexpr double kDefaultRate = 30.0;
-constexpr double kNoise = 3e-5; // of the longest bone: what single precision in the file amounts to
+constexpr double kNoise = 1e-5; // of the longest bone: what single precision in the file amounts to
 
 struct Placement
 {
@@ -168,6 +168,13 @@ double RateOfFile(const CSceneNodes& nodes, const aiAnimation& clip)
     return RateOfKeys(clip, TicksPerSecond(clip));
 }
 
+// Noise in a bone that is parallel to an axis would decide where its mesh points.
+Vec3 WithoutNoise(const Vec3& v, double longest)
+{
+    const auto settled = [=](float x) { return std::fabs(x) <= kNoise * longest ? 0.0f : x; };
+    return {settled(v.x), settled(v.y), settled(v.z)};
+}
+
 // Joints that only rotate keep exactly their offsets.
 void SettleOffsets(ImportedMotion& motion)
 {
@@ -177,8 +184,9 @@ void SettleOffsets(ImportedMotion& motion)
     for (size_t i = 1; i < motion.joints.size(); ++i)
     {
         ImportedJoint& joint = motion.joints[i];
+        joint.offset = WithoutNoise(joint.offset, longest);
         const auto isSettled = [&](const Vec3& p) {
-            return Vec3Length(p - joint.offset) <= kNoise * longest;
+            return Vec3Length(p - joint.offset) <= 2.0 * kNoise * longest;
         };
         if (std::ranges::all_of(joint.positions, isSettled))
             std::ranges::fill(joint.positions, joint.offset);
