@@ -80,11 +80,26 @@ def motions():
     yield "cha", {"small": made.page_file("tiny.cha")}
     chb = made.page_file("tiny.chb")
     yield "chb", {"small": chb, "old": chb.replace(struct.pack("<i", 721), struct.pack("<i", 100), 1)}
+    body = [("Hips", -1), ("Spine", 0), ("Head", 1), ("Leg", 0)]
+    yield "import", {"still": message(1, body), "moving": message(3, body), "refused": message(0, [], 1, "no scene")}
     ways = {"plain": 0, "packaged": 2, "feet": 4, "all": 2 | 8 | 16 | 32 | 64}
     converts = {"walk-" + what: bytes([way]) + walk.encode() for what, way in ways.items()}
     converts["scene"] = b"\1" + made.one_bone_scene()
     converts["small"] = b"\0" + made.BVH.encode()
     yield "convert", converts
+
+
+def sent_text(text):
+    return struct.pack("<I", len(text)) + text.encode()
+
+
+def message(frames, joints, outcome=0, words=""):
+    """What the import program sends. Joints are names and parents."""
+    keys = struct.pack("<3f", 0, 1, 0) * frames + struct.pack("<4f", 1, 0, 0, 0) * frames
+    bones = b"".join(sent_text(name) + struct.pack("<i3f", parent, 0, 1, 0) + keys for name, parent in joints)
+    head = struct.pack("<I", outcome) + sent_text(words) + struct.pack("<I", 1) + 2 * sent_text("walk")
+    facts = struct.pack("<dBdBII", 30, 1, 0.01, 0, frames, len(joints))
+    return b"gaitwright import 1\n" + head + facts + bones
 
 
 def maps():

@@ -106,15 +106,23 @@ bool TKImportStream::Load(const std::string& path)
     uint64_t size = 0;
     if (!FileSize(path, size))
         return m_kRecord.Fail(FolderExists(path) ? EFailure::NotRegular : EFailure::NotFound);
+    std::vector<std::byte> message;
+    return Run(path, message) && Receive(message);
+}
+
+bool TKImportStream::Receive(std::span<const std::byte> message)
+{
     ImportedMotion motion;
-    if (!Run(path, motion) || !Check(motion))
+    if (!ReadImported(message, motion))
+        return m_kRecord.Fail(EFailure::ImportStopped);
+    if (!Check(motion))
         return false;
     imported = {motion.clip, motion.clips, motion.isRateOfFile, motion.unitMeters, motion.wasTurnedUp};
     BuildAnimatedTree(motion);
     return true;
 }
 
-bool TKImportStream::Run(const std::string& path, ImportedMotion& motion)
+bool TKImportStream::Run(const std::string& path, std::vector<std::byte>& message)
 {
     std::vector<std::string> arguments;
     if (!importChoice.clip.empty())
@@ -122,12 +130,9 @@ bool TKImportStream::Run(const std::string& path, ImportedMotion& motion)
     if (importChoice.rate > 0.0)
         arguments.push_back("--rate=" + std::to_string(importChoice.rate));
     arguments.push_back(PathArgument(path));
-    std::vector<std::byte> output;
     const EChildEnd end =
-        RunChild(ExecutableFolder() + kProgram, arguments, kLimits, output, [this] { Report(0, 0); });
-    if (end != EChildEnd::Finished)
-        return m_kRecord.Fail(FailureOf(end));
-    return ReadImported(output, motion) || m_kRecord.Fail(EFailure::ImportStopped);
+        RunChild(ExecutableFolder() + kProgram, arguments, kLimits, message, [this] { Report(0, 0); });
+    return end == EChildEnd::Finished || m_kRecord.Fail(FailureOf(end));
 }
 
 bool TKImportStream::Check(const ImportedMotion& motion)
@@ -141,7 +146,8 @@ bool TKImportStream::Check(const ImportedMotion& motion)
         return m_kRecord.Fail(EFailure::NoSkeleton);
     if (motion.joints.size() > kBoneLimit)
         return m_kRecord.Fail(EFailure::TooLarge, 0, motion.joints[kBoneLimit].name);
-    if (!(motion.rate > 0.0) || !std::isfinite(1.0 / motion.rate))
+    const auto frameTime = static_cast<float>(1.0 / motion.rate);
+    if (!(frameTime > 0.0f) || !std::isfinite(frameTime) || !std::isfinite(motion.unitMeters))
         return m_kRecord.Fail(EFailure::BadNumber);
     for (const ImportedJoint& joint : motion.joints)
     {

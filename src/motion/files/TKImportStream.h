@@ -2,6 +2,9 @@
 
 #include "CMotionFile.h"
 
+#include <span>
+#include <vector>
+
 namespace gw {
 
 struct ImportedMotion;
@@ -20,9 +23,11 @@ class TKImportStream : public CMotionFile
 public:
     /// Fills motionRoot and `imported`. `importChoice` selects the clip.
     bool Load(const std::string& path) override;
+    /// The same for what the program sent, as if it came from it now.
+    bool Receive(std::span<const std::byte> message);
 
 private:
-    bool Run(const std::string& path, ImportedMotion& motion);
+    bool Run(const std::string& path, std::vector<std::byte>& message);
     bool Check(const ImportedMotion& motion);
     void BuildAnimatedTree(ImportedMotion& motion);
 };

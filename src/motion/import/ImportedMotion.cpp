@@ -141,8 +141,9 @@ bool ReadJoint(CReader& reader, size_t index, uint32_t frameCount, ImportedJoint
 
 bool ReadJoints(CReader& reader, ImportedMotion& motion)
 {
+    const size_t keyBytes = size_t{motion.frameCount} * (sizeof(Vec3) + sizeof(Quat));
     uint32_t count = 0;
-    if (!reader.GetCount(count, sizeof(uint32_t)))
+    if (!reader.GetCount(count, sizeof(uint32_t) + sizeof(int32_t) + sizeof(Vec3) + keyBytes))
         return false;
     motion.joints.resize(count);
     for (size_t i = 0; i < count; ++i)
