@@ -3,6 +3,7 @@
 #include "CModelFiles.h"
 #include "CSceneNodes.h"
 
+#include <new>
 #include <string_view>
 
 #include <assimp/config.h>
@@ -45,6 +46,12 @@ const aiScene* CModelReader::Read()
         scene = m_kImporter.ReadFile(m_pkFiles->ModelName(), 0);
     }
     return scene && scene->mRootNode ? scene : nullptr;
+}
+
+// The library catches that too, and passes on the text of the exception.
+bool CModelReader::IsOutOfMemory() const
+{
+    return std::string_view(m_kImporter.GetErrorString()) == std::bad_alloc().what();
 }
 
 // The library's own words for a file that is of no format repeat its path.

@@ -16,6 +16,8 @@ public:
 
     /// Returns the file's scene, which lives as long as the reader; null if it cannot be read.
     const aiScene* Read();
+    /// Returns whether there was not enough memory for it.
+    bool IsOutOfMemory() const;
     /// Returns why not, in words.
     std::string WhyNot() const;
 

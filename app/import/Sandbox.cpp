@@ -1,5 +1,6 @@
 #include "Sandbox.h"
 
+#include <algorithm>
 #include <cerrno>
 #include <csignal>
 #include <cstdint>
@@ -18,10 +19,15 @@ namespace {
 constexpr rlim_t kMemoryBytes = rlim_t{6} << 30;
 constexpr rlim_t kComputingSeconds = 300;
 
-bool Limit(int resource, rlim_t most)
+// A lower limit of whoever started the program stays: not everybody may raise it.
+bool Limit(__rlimit_resource resource, rlim_t most)
 {
-    const rlimit limit{most, most};
-    return setrlimit(static_cast<__rlimit_resource>(resource), &limit) == 0;
+    rlimit limit{};
+    if (getrlimit(resource, &limit) != 0)
+        return false;
+    limit.rlim_max = std::min(limit.rlim_max, most);
+    limit.rlim_cur = std::min(limit.rlim_cur, limit.rlim_max);
+    return setrlimit(resource, &limit) == 0;
 }
 
 // The address sanitizer reserves more addresses than any limit.

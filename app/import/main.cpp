@@ -51,9 +51,14 @@ Order ReadArguments(int count, char** arguments)
     return order;
 }
 
-std::string ClipName(const aiAnimation& clip, unsigned index)
+// Returns a name by which this clip, and no earlier one, can be requested. `taken` has the earlier names.
+std::string ClipName(const aiAnimation& clip, unsigned index, std::unordered_set<std::string>& taken)
 {
-    return clip.mName.length > 0 ? clip.mName.C_Str() : "clip " + std::to_string(index + 1);
+    const std::string name = clip.mName.length > 0 ? clip.mName.C_Str() : "clip " + std::to_string(index + 1);
+    std::string unique = name;
+    for (int number = 2; !taken.insert(LowerCase(unique)).second; ++number)
+        unique = name + ' ' + std::to_string(number);
+    return unique;
 }
 
 // Returns the requested clip, or the longest; null if the file does not have it.
@@ -61,10 +66,11 @@ const aiAnimation* ChooseClip(const aiScene& scene, const Order& order, Imported
 {
     const aiAnimation* chosen = nullptr;
     double longest = -1.0;
+    std::unordered_set<std::string> taken;
     for (unsigned i = 0; i < scene.mNumAnimations; ++i)
     {
         const aiAnimation& clip = *scene.mAnimations[i];
-        motion.clips.push_back(ClipName(clip, i));
+        motion.clips.push_back(ClipName(clip, i, taken));
         const double seconds = clip.mDuration / std::max(clip.mTicksPerSecond, 1.0);
         const bool fits =
             order.clip.empty() ? seconds > longest : !chosen && EqualNoCase(motion.clips.back(), order.clip);
@@ -157,6 +163,8 @@ ImportedMotion Import(const Order& order)
     CModelReader reader(order.path);
     if (const aiScene* const scene = reader.Read())
         ReadScene(*scene, order, motion);
+    else if (reader.IsOutOfMemory())
+        Refuse(motion, EImport::TooLarge);
     else
         Refuse(motion, EImport::Refused, reader.WhyNot());
     return motion;
