@@ -16,7 +16,7 @@ namespace gw {
 
 namespace {
 
-constexpr rlim_t kMemoryBytes = rlim_t{6} << 30;
+constexpr rlim_t kMemoryBytes = rlim_t{4} << 30;
 constexpr rlim_t kComputingSeconds = 300;
 
 // A lower limit of whoever started the program stays: not everybody may raise it.

@@ -24,7 +24,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kMostKeys = 1 << 27; // 28 bytes each, 3.5 GB
+constexpr double kMostKeys = 1 << 25; // 28 bytes each; a body of 65 joints for two hours
 
 struct Order
 {

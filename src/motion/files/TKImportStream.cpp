@@ -18,7 +18,7 @@ namespace {
 
 constexpr const char* kProgram = "gaitwright-import";
 // The program limits its own memory and computing time; these limits are for one that hangs or floods.
-constexpr ChildLimits kLimits{.seconds = 600.0, .outputBytes = size_t{4} << 30};
+constexpr ChildLimits kLimits{.seconds = 600.0, .outputBytes = size_t{1} << 30};
 
 // A path that begins with a hyphen is not an option.
 std::string PathArgument(const std::string& path)
