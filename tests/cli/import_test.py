@@ -176,8 +176,10 @@ class Import(CliTest):
     @unittest.skipIf(SANITIZED, "the sanitizer needs more addresses than any limit leaves")
     def test_limits_of_memory_and_time_are_told(self):
         self.write("a.fbx", "; FBX 7.4.0 project file\nA: *9 {\n a: " + "0," * 3_000_000 + "0\n}\n")
-        for limit, words in (("-v 300000", "exceeds a limit"), ("-t 1", "ended before it was done")):
-            result = self.run_program("-c", "ulimit " + limit + '; exec "$0" info a.fbx', PROGRAM, program="/bin/sh")
+        self.write("b.glb", Model().walk(frames=2, rate=1 / 50_000).glb())  # two keys, many frames
+        for limit, words in (("ulimit -v 300000; exec $0 info a.fbx", "exceeds a limit"),
+                             ("ulimit -t 1; exec $0 info b.glb", "ended before it was done")):
+            result = self.run_program("-c", limit, PROGRAM, program="/bin/sh")
             self.assertEqual(result.code, FAILED, result.err)
             self.assert_words(result, [words])
 
