@@ -4,7 +4,10 @@
 #include "CMotionFile.h"
 #include "CMotionSampler.h"
 #include "GlbFile.h"
+#include "Rotations.h"
+#include "Sandbox.h"
 #include "Skeleton.h"
+#include "TKImportStream.h"
 #include "TempFolder.h"
 
 #include <assimp/Importer.hpp>
@@ -14,9 +17,15 @@
 
 #include <algorithm>
 #include <filesystem>
+#include <fstream>
 #include <map>
 #include <string>
 #include <vector>
+
+#include <fcntl.h>
+#include <sys/socket.h>
+#include <sys/stat.h>
+#include <unistd.h>
 
 namespace gw {
 
@@ -77,17 +86,29 @@ float HeightOf(const Places& places)
 
 } // namespace
 
+// Models of others, and one of our own, which needs no data.
+std::vector<std::string> ModelPaths(const CTempFolder& folder)
+{
+    std::vector<std::string> paths{folder.Path("walk.glb")};
+    CMotionFile walk;
+    CFailureRecord record;
+    EXPECT_TRUE(walk.Load(WALK_FILE) && SaveGlb(walk, 0.01, paths.front(), record));
+    const std::string data = SharedDataFolder();
+    for (const auto& entry : data.empty() ? std::filesystem::directory_iterator()
+                                          : std::filesystem::directory_iterator(data + "models"))
+    {
+        if (IsImported(entry.path().string()))
+            paths.push_back(entry.path().string());
+    }
+    return paths;
+}
+
 // Without helpers for pivots, the library's nodes are the joints.
 TEST(Import, JointsAreWhereTheLibraryPutsThem)
 {
-    const std::string folder = SharedDataFolder();
-    if (folder.empty())
-        GTEST_SKIP() << "needs models";
-    for (const auto& entry : std::filesystem::directory_iterator(folder + "models"))
+    const CTempFolder folder;
+    for (const std::string& path : ModelPaths(folder))
     {
-        const std::string path = entry.path().string();
-        if (entry.path().extension() == ".md")
-            continue;
         SCOPED_TRACE(path);
         Assimp::Importer importer;
         importer.SetPropertyBool(AI_CONFIG_IMPORT_FBX_PRESERVE_PIVOTS, false);
@@ -109,6 +130,28 @@ TEST(Import, JointsAreWhereTheLibraryPutsThem)
     }
 }
 
+// In a process of its own, which keeps the limits.
+TEST(Import, TheSandboxChangesNothingOutside)
+{
+    const CTempFolder folder;
+    const std::string path = folder.Path("kept");
+    std::ofstream(path) << "kept";
+    const auto isShut = [&] {
+        const bool canRead = EnterSandbox() && open(path.c_str(), O_RDONLY) >= 0;
+        const int forbidden[] = {open(path.c_str(), O_WRONLY),
+                                 open(path.c_str(), O_RDONLY | O_TRUNC),
+                                 open(folder.Path("new").c_str(), O_RDONLY | O_CREAT, 0600),
+                                 mkdir(folder.Path("folder").c_str(), 0700),
+                                 unlink(path.c_str()),
+                                 rename(path.c_str(), folder.Path("new").c_str()),
+                                 socket(AF_INET, SOCK_STREAM, 0),
+                                 static_cast<int>(fork())};
+        return canRead && std::ranges::all_of(forbidden, [](int result) { return result < 0; });
+    };
+    EXPECT_EXIT(_exit(isShut() ? 0 : 1), testing::ExitedWithCode(0), "");
+    EXPECT_EQ(std::filesystem::file_size(path), 4u);
+}
+
 TEST(Import, AWrittenMotionComesBack)
 {
     const CTempFolder folder;
@@ -121,13 +164,21 @@ TEST(Import, AWrittenMotionComesBack)
     EXPECT_EQ(copy.GetKeyCount(), motion.GetKeyCount());
     EXPECT_NEAR(copy.GetFrequency(), motion.GetFrequency(), 1e-5);
     EXPECT_EQ(copy.imported.unitMeters, 1.0);
-    for (const int frame : {0, 7, motion.GetKeyCount() - 1})
+    const std::vector<CNode*> joints = NodesOf(*motion.motionRoot);
+    const std::vector<CNode*> copies = NodesOf(*copy.motionRoot);
+    ASSERT_EQ(copies.size(), joints.size());
+    for (int frame = 0; frame < motion.GetKeyCount(); ++frame)
     {
-        const Places expected = PlacesOf(motion, frame);
-        const Places places = PlacesOf(copy, frame);
-        ASSERT_EQ(places.size(), expected.size());
-        for (const auto& [name, place] : places)
-            EXPECT_LT(Vec3Length(place * 100.0f - expected.at(name)), 1e-4f * HeightOf(expected)) << name;
+        const float height = HeightOf(PlacesOf(motion, frame));
+        PlacesOf(copy, frame);
+        for (size_t i = 0; i < joints.size(); ++i)
+        {
+            const Mat4& world = joints[i]->m_kWorldMatrix;
+            const Mat4& again = copies[i]->m_kWorldMatrix;
+            EXPECT_LT(Vec3Length(again.Translation() * 100.0f - world.Translation()), 1e-4f * height);
+            EXPECT_LT(DegreesBetween(NormalizedRows(again), NormalizedRows(world)), 0.01)
+                << joints[i]->NameView();
+        }
     }
 }
 
