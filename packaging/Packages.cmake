@@ -25,9 +25,10 @@ set(CPACK_DEBIAN_SHELL_PACKAGE_SECTION graphics)
 set(CPACK_DEBIAN_SHELL_PACKAGE_RECOMMENDS "libgl1-mesa-dri, gaitwright-import")
 set(CPACK_COMPONENT_SHELL_DESCRIPTION
     "motion capture converted to one fixed skeleton, in the shell
-Reads BVH, HTR, CHA and CHB motions and scene containers with keyframed
-bones, moves them onto the target skeleton by a bone map, plants the feet,
-and writes Kinetra files. Whole archives convert in one run.
+Reads BVH, HTR, CHA and CHB motions, scene containers with keyframed bones
+and, with gaitwright-import, FBX, glTF and Collada files. It moves them onto
+the target skeleton by a bone map, plants the feet, and writes Kinetra
+files. Whole archives convert in one run.
 .
 This package holds the command line program, which needs no display, the
 target skeleton and the bone maps of common conventions.")
@@ -47,9 +48,9 @@ set(CPACK_DEBIAN_DESKTOP_PACKAGE_DEPENDS
 set(CPACK_DEBIAN_DESKTOP_PACKAGE_RECOMMENDS "fonts-dejavu-core | fonts-freefont-ttf")
 set(CPACK_COMPONENT_DESKTOP_DESCRIPTION
     "motion capture converted to one fixed skeleton, in a window
-Opens a BVH, HTR, CHA or CHB motion, converts it by a bone map, plays source
-and result side by side, and saves a Kinetra file. An editor makes and
-changes bone maps.")
+Opens a BVH, HTR, CHA or CHB motion and, with gaitwright-import, an FBX, glTF
+or Collada file, converts it by a bone map, plays source and result side by
+side, and saves a Kinetra file. An editor makes and changes bone maps.")
 
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_SHLIBDEPS OFF) # the package has no shared libraries
