@@ -3,6 +3,7 @@
 
 #include "CMotionFile.h"
 #include "CMotionSampler.h"
+#include "Directions.h"
 #include "GlbFile.h"
 #include "Rotations.h"
 #include "Sandbox.h"
@@ -152,32 +153,39 @@ TEST(Import, TheSandboxChangesNothingOutside)
     EXPECT_EQ(std::filesystem::file_size(path), 4u);
 }
 
+// Another up axis than Y is turned, and rotations are relative to the turned rest pose.
 TEST(Import, AWrittenMotionComesBack)
 {
     const CTempFolder folder;
     CMotionFile motion;
     ASSERT_TRUE(motion.Load(WALK_FILE));
-    CFailureRecord record;
-    ASSERT_TRUE(SaveGlb(motion, 0.01, folder.Path("walk.glb"), record));
-    CMotionFile copy;
-    ASSERT_TRUE(copy.Load(folder.Path("walk.glb")));
-    EXPECT_EQ(copy.GetKeyCount(), motion.GetKeyCount());
-    EXPECT_NEAR(copy.GetFrequency(), motion.GetFrequency(), 1e-5);
-    EXPECT_EQ(copy.imported.unitMeters, 1.0);
-    const std::vector<CNode*> joints = NodesOf(*motion.motionRoot);
-    const std::vector<CNode*> copies = NodesOf(*copy.motionRoot);
-    ASSERT_EQ(copies.size(), joints.size());
-    for (int frame = 0; frame < motion.GetKeyCount(); ++frame)
+    for (const Vec3& up : {kVec3UnitY, kVec3UnitZ})
     {
-        const float height = HeightOf(PlacesOf(motion, frame));
-        PlacesOf(copy, frame);
-        for (size_t i = 0; i < joints.size(); ++i)
+        SCOPED_TRACE(AxisName(up));
+        const Mat3 upright = LeastSwing(up, kVec3UnitY);
+        CFailureRecord record;
+        ASSERT_TRUE(SaveGlb(motion, 0.01, folder.Path("walk.glb"), record, up));
+        CMotionFile copy;
+        ASSERT_TRUE(copy.Load(folder.Path("walk.glb")));
+        EXPECT_EQ(copy.GetKeyCount(), motion.GetKeyCount());
+        EXPECT_NEAR(copy.GetFrequency(), motion.GetFrequency(), 1e-5);
+        EXPECT_EQ(copy.imported.unitMeters, 1.0);
+        const std::vector<CNode*> joints = NodesOf(*motion.motionRoot);
+        const std::vector<CNode*> copies = NodesOf(*copy.motionRoot);
+        ASSERT_EQ(copies.size(), joints.size());
+        for (int frame = 0; frame < motion.GetKeyCount(); ++frame)
         {
-            const Mat4& world = joints[i]->m_kWorldMatrix;
-            const Mat4& again = copies[i]->m_kWorldMatrix;
-            EXPECT_LT(Vec3Length(again.Translation() * 100.0f - world.Translation()), 1e-4f * height);
-            EXPECT_LT(DegreesBetween(NormalizedRows(again), NormalizedRows(world)), 0.01)
-                << joints[i]->NameView();
+            const float height = HeightOf(PlacesOf(motion, frame));
+            PlacesOf(copy, frame);
+            for (size_t i = 0; i < joints.size(); ++i)
+            {
+                const Mat4& world = joints[i]->m_kWorldMatrix;
+                const Mat4& again = copies[i]->m_kWorldMatrix;
+                const Vec3 place = Turned(world.Translation(), upright);
+                EXPECT_LT(Vec3Length(again.Translation() * 100.0f - place), 1e-4f * height);
+                const Mat3 rotation = Mat3Transpose(upright) * NormalizedRows(world) * upright;
+                EXPECT_LT(DegreesBetween(NormalizedRows(again), rotation), 0.01) << joints[i]->NameView();
+            }
         }
     }
 }

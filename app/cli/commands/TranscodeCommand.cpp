@@ -12,6 +12,7 @@
 #include "Streams.h"
 #include "TKBVHStream.h"
 #include "Text.h"
+#include "UpAxis.h"
 #include "Words.h"
 
 #include <cmath>
@@ -77,13 +78,18 @@ double MetersPerUnit(const CMotionFile& motion)
     return unit > 0.0 ? unit : MetersOfUnit(RestLegLength(FindBody(*motion.motionRoot).body));
 }
 
+Vec3 UpAxisOf(const CMotionFile& motion)
+{
+    return FindUpAxis(FindBody(*motion.motionRoot).body, motion.GetFrequency(), motion.GetKeyCount());
+}
+
 // Writes the file by its extension. If that fails, records the reason and returns false.
 bool Write(const ShellOptions& options, CMotionFile& motion, const std::string& path, CFailureRecord& record)
 {
     if (HasExtension(path, ".htr"))
         return motion.Save(path, options.frameScale) || record.Fail(motion.Record().Failure());
     if (HasExtension(path, ".glb"))
-        return SaveGlb(motion, MetersPerUnit(motion), path, record);
+        return SaveGlb(motion, MetersPerUnit(motion), path, record, UpAxisOf(motion));
     TKBVHStream stream(motion);
     return stream.WriteFile(path) || record.Fail(stream.Record().Failure());
 }

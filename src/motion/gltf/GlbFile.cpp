@@ -13,6 +13,7 @@
 #include "CMotionFile.h"
 #include "CMotionSampler.h"
 #include "CSafeFile.h"
+#include "Directions.h"
 #include "Quat.h"
 #include "Skeleton.h"
 
@@ -67,8 +68,10 @@ void Append(std::vector<float>& values, const Mat4& matrix)
 class CGlbWriter
 {
 public:
-    CGlbWriter(const CMotionFile& motion, double metersPerUnit)
-        : motion_(motion), m_fScale(static_cast<float>(metersPerUnit)), m_kNodes(NodesOf(*motion.motionRoot))
+    CGlbWriter(const CMotionFile& motion, double metersPerUnit, const Vec3& up)
+        : motion_(motion), m_fScale(static_cast<float>(metersPerUnit)),
+          m_kUpright(Mat4Compose(LeastSwing(up, kVec3UnitY), kVec3Zero)),
+          m_kNodes(NodesOf(*motion.motionRoot))
     {
         for (size_t i = 0; i < m_kNodes.size(); ++i)
             m_kIndexOfNode.emplace(m_kNodes[i], i);
@@ -83,9 +86,12 @@ private:
     void AddAnimation();
     void AddChannel(Json& animation, size_t node, const char* path, size_t times, size_t keys);
     std::vector<BoneBox> Boxes() const;
+    // Returns where a joint is at rest in the file.
+    Mat4 RestOf(const CNode& node) const { return node.m_kWorldMatrix * m_kUpright; }
 
     const CMotionFile& motion_;
     const float m_fScale;
+    const Mat4 m_kUpright; // from the motion's world to the file's
     const std::vector<CNode*> m_kNodes;
     std::unordered_map<const CNode*, size_t> m_kIndexOfNode;
     CGlbBuffer m_kBuffer;
@@ -145,8 +151,20 @@ void CGlbWriter::AddNodes()
         {"mesh", 0     },
         {"skin", 0     },
     });
+    size_t root = 0;
+    if (m_kUpright != kMat4Identity)
+    {
+        std::vector<float> rotation;
+        Append(rotation, m_kUpright);
+        root = nodes.size();
+        nodes.push_back({
+            {"name",     "Armature"},
+            {"rotation", rotation  },
+            {"children", {0}       },
+        });
+    }
     m_kFile["scene"] = 0;
-    m_kFile["scenes"] = {{{"nodes", {0, m_kNodes.size()}}}};
+    m_kFile["scenes"] = {{{"nodes", {root, m_kNodes.size()}}}};
     m_kFile["nodes"] = std::move(nodes);
 }
 
@@ -156,7 +174,7 @@ void CGlbWriter::AddSkin()
     Json joints = Json::array();
     for (size_t i = 0; i < m_kNodes.size(); ++i)
     {
-        Mat4 rest = m_kNodes[i]->m_kWorldMatrix;
+        Mat4 rest = RestOf(*m_kNodes[i]);
         const Mat3 rotation = NormalizedRows(rest);
         const Mat4 inverse = Mat4InverseOrIdentity(Mat4Compose(rotation, rest.Translation() * m_fScale));
         inverses.insert(inverses.end(), std::begin(inverse.m), std::end(inverse.m));
@@ -175,11 +193,11 @@ std::vector<BoneBox> CGlbWriter::Boxes() const
     std::vector<BoneBox> boxes;
     for (size_t i = 0; i < m_kNodes.size(); ++i)
     {
-        const Mat4& world = m_kNodes[i]->m_kWorldMatrix;
+        const Mat4 world = RestOf(*m_kNodes[i]);
         const Vec3 from = world.Translation() * m_fScale;
         const std::vector<CNode*> children = ChildNodes(*m_kNodes[i]);
         for (const CNode* child : children)
-            boxes.push_back({static_cast<uint16_t>(i), from, child->m_kWorldMatrix.Translation() * m_fScale});
+            boxes.push_back({static_cast<uint16_t>(i), from, RestOf(*child).Translation() * m_fScale});
         if (children.empty())
             boxes.push_back({static_cast<uint16_t>(i), from,
                              TransformCoord(NodeBoneEnd(*m_kNodes[i]), world) * m_fScale});
@@ -274,22 +292,25 @@ void CGlbWriter::AddAnimation()
 
 } // namespace
 
-bool WriteGlb(const CMotionFile& motion, double metersPerUnit, const CByteSink& sink, CFailureRecord& record)
+bool WriteGlb(const CMotionFile& motion, double metersPerUnit, const CByteSink& sink, CFailureRecord& record,
+              const Vec3& up)
 {
     if (!motion.motionRoot)
         return record.Fail(EFailure::NoRoot);
     if (NodesOf(*motion.motionRoot).size() > std::numeric_limits<uint16_t>::max())
         return record.Fail(EFailure::TooLarge);
-    return CGlbWriter(motion, metersPerUnit).Write(sink) || record.Fail(EFailure::WriteError);
+    return CGlbWriter(motion, metersPerUnit, up).Write(sink) || record.Fail(EFailure::WriteError);
 }
 
-bool SaveGlb(const CMotionFile& motion, double metersPerUnit, const std::string& path, CFailureRecord& record)
+bool SaveGlb(const CMotionFile& motion, double metersPerUnit, const std::string& path, CFailureRecord& record,
+             const Vec3& up)
 {
     CSafeFile file;
     if (!file.Open(path))
         return record.Fail(file.Failure());
     const CByteSink sink = [&](std::span<const std::byte> bytes) { return file.Write(bytes); };
-    return WriteGlb(motion, metersPerUnit, sink, record) && (file.Commit() || record.Fail(file.Failure()));
+    return WriteGlb(motion, metersPerUnit, sink, record, up) &&
+           (file.Commit() || record.Fail(file.Failure()));
 }
 
 } // namespace gw
