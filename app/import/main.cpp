@@ -16,6 +16,7 @@
 #include <cstdlib>
 #include <new>
 #include <numbers>
+#include <span>
 #include <string>
 #include <string_view>
 #include <unordered_set>
@@ -135,6 +136,23 @@ std::string SharedName(const CSceneNodes& nodes, const aiAnimation* clip)
     return {};
 }
 
+// The library copies keys of short numbers as if they were long ones. What comes out are no rotations.
+bool HasBadRotation(const aiAnimation* clip)
+{
+    for (unsigned i = 0; clip && i < clip->mNumChannels; ++i)
+    {
+        const std::span keys(clip->mChannels[i]->mRotationKeys, clip->mChannels[i]->mNumRotationKeys);
+        const bool areGood = std::ranges::all_of(keys, [](const aiQuatKey& key) {
+            const aiQuaternion& q = key.mValue;
+            const float square = q.w * q.w + q.x * q.x + q.y * q.y + q.z * q.z;
+            return square > 0.25f && square < 4.0f;
+        });
+        if (!areGood)
+            return true;
+    }
+    return false;
+}
+
 void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
 {
     const CSceneNodes nodes(scene);
@@ -146,6 +164,9 @@ void ReadScene(const aiScene& scene, const Order& order, ImportedMotion& motion)
         return Refuse(motion, EImport::NoSkeleton);
     if (const std::string name = SharedName(nodes, animation); !name.empty())
         return Refuse(motion, EImport::Refused, "it moves several nodes that are all called " + name);
+    if (HasBadRotation(animation))
+        return Refuse(motion, EImport::Refused,
+                      "its rotations are damaged, or packed in a way that is not supported");
     const SceneClip clip = PlanClip(nodes, animation, order.rate);
     if (!(clip.frames * static_cast<double>(skeleton.nodes.size()) < kMostKeys))
         return Refuse(motion, EImport::TooLarge);

@@ -154,7 +154,8 @@ bool TKImportStream::Check(const ImportedMotion& motion)
         if (!MayBeName(joint.name))
             return m_kRecord.Fail(EFailure::BadName, 0, joint.name);
         if (!HasFiniteKeys(joint))
-            return m_kRecord.Fail(EFailure::BadNumber, 0, joint.name);
+            return m_kRecord.Fail(EFailure::NotImported, 0,
+                                  "the joint " + joint.name + " has a place that is no number");
     }
     return true;
 }
