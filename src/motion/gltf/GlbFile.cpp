@@ -256,6 +256,7 @@ void CGlbWriter::AddAnimation()
     const int frameCount = std::max(motion_.GetKeyCount(), 1);
     const float frameTime = motion_.GetFrequency();
     std::vector<float> times;
+    times.reserve(static_cast<size_t>(frameCount));
     for (int frame = 0; frame < frameCount; ++frame)
         times.push_back(static_cast<float>(frame) * frameTime);
     CMotionSampler sampler(*motion_.motionRoot);
