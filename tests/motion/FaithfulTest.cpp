@@ -138,7 +138,7 @@ TEST_F(Faithful, KneesBendInTheSourcesPlaneAndFeetKeepTheirTurn)
         {
             ExpectLeg(side, 4.0, 6.0);
             const Mat3 turned = halfTurn * NormalizedRows(m_kWalker.Bone(side + "Ankle").m_kWorldMatrix);
-            EXPECT_LT(DegreesBetween(NormalizedRows(Target(side + "Foot").m_kWorldMatrix), turned), 1.2);
+            EXPECT_LT(DegreesBetween(NormalizedRows(Target(side + "Foot").m_kWorldMatrix), turned), 2.0);
         }
     }
 }

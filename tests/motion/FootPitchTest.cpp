@@ -36,5 +36,15 @@ TEST(FootPitch, TurnsTowardTheWantedPlaceSoftlyAndNoFartherThanItsLimit)
     EXPECT_NEAR(turned(-20.0, {0.0, std::numeric_limits<double>::quiet_NaN()}), 0.0, 1e-4);
 }
 
+TEST(FootPitch, LowersTheToeAndKeepsHeadingAndLength)
+{
+    const Vec3 toe{60.0f, -50.0f, 80.0f};
+    const Vec3 lowered = Turned(toe, LoweredToe(toe, 5.0));
+    EXPECT_NEAR(lowered.y, -55.0f, 1e-3f);
+    EXPECT_NEAR(lowered.x / lowered.z, toe.x / toe.z, 1e-4f);
+    EXPECT_NEAR(Vec3Length(lowered), Vec3Length(toe), 1e-3f);
+    EXPECT_EQ(LoweredToe({0.0f, -100.0f, 0.0f}, 5.0), kMat3Identity) << "an upright foot";
+}
+
 } // namespace
 } // namespace gw

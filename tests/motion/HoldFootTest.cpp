@@ -128,6 +128,21 @@ TEST(HoldFoot, ShortDriftIsTakenAwayAndALongOneKept)
     }
 }
 
+// The foot stands on its ankle, and its toe swings to where it stays. Before that is one frame of a stance
+// elsewhere, which says nothing about how fast the ankle is.
+TEST(HoldFoot, JumpBeforeAContactDoesNotMoveThePivot)
+{
+    Foot foot;
+    foot.Add({0.0f, 0.0f, 700.0f}, 0.0f, 0.0f);
+    for (int frame = 1; frame < 60; ++frame)
+        foot.Add(kVec3Zero, std::max(60.0f - 10.0f * static_cast<float>(frame), 0.0f), 0.0f);
+    const size_t jumps[] = {0};
+    const std::vector<Vec3> path = HoldFoot({foot.free, foot.toe, foot.sourceAnkle, foot.sourceToe, kLeg},
+                                            {{Contact{1, 60}}}, kSeconds, jumps);
+    for (size_t frame = 2; frame < 60; ++frame)
+        EXPECT_NEAR(path[frame].z, path[1].z, 6.0f) << frame;
+}
+
 TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
 {
     std::vector<float> free(240, 30.0f);
@@ -137,7 +152,7 @@ TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
     const std::vector<double> heights = LandFoot(free, landed, kSeconds);
     EXPECT_NEAR(heights[10], 30.0, 1.0) << "on its free path";
     EXPECT_NEAR(heights[90], -40.0 / 16.0, 1.0) << "a sixteenth of a dip stays";
-    EXPECT_NEAR(heights[190], 30.0 / 9.0, 2.0) << "nearly on the floor";
+    EXPECT_NEAR(heights[190], 30.0 / 7.0, 1.5) << "nearly on the floor";
 }
 
 TEST(SmoothCurve, KeepsPlaceAndSumOfAPeakAndTheEndsOfALine)

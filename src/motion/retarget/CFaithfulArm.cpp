@@ -90,7 +90,7 @@ void CFaithfulArm::MoveHand(const CPoseMatcher& matcher, const Vec3& way, size_t
     const Vec3 asked = free + way;
     const double bend = BendAt(m_kLengths, Vec3Length(free));
     const double reach =
-        ReachAt(m_kLengths, YieldingBend(m_kLengths, Vec3Length(asked), bend, kLimbStiffness));
+        ReachAt(m_kLengths, YieldingBend(m_kLengths, Vec3Length(asked), bend, kElbowStiffness));
     const Vec3 goal = Vec3Normalized(asked) * static_cast<float>(reach);
     const Vec3 usual = Vec3Normalized(Turned(m_kBend, TurnOfBone(matcher, upperArm))) * kUsualSide;
     const Vec3 elbow = MiddleJoint(m_kLengths, goal, Pole(matcher) + usual);

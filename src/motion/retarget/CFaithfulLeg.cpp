@@ -102,8 +102,14 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
     }
     const Mat4& thigh = bones[m_uiThigh].world;
     at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
+    at.heel = -heel.y;
     at.sole = -lowest;
     m_kForward = m_kForward + ToLocal(at.thigh - at.shin, NormalizedRows(thigh));
+}
+
+float CFaithfulLeg::ToeSole(size_t frame) const
+{
+    return m_iToe < 0 ? 0.0f : m_fToeSole - m_kFrames[frame].toe.y;
 }
 
 Vec3 CFaithfulLeg::Stretch(size_t frame) const

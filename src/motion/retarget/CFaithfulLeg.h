@@ -22,7 +22,8 @@ public:
         Vec3 shin;                  ///< unit direction of the source from knee to ankle
         Vec3 hip = kVec3Zero;       ///< the target's hip joint, relative to its root
         Vec3 toe = kVec3Zero;       ///< the target's toe joint, relative to its ankle; zero without one
-        float sole = 0.0f;          ///< how far the sole's lower end is below the target's ankle
+        float heel = 0.0f;          ///< how far the sole's heel end is below the target's ankle
+        float sole = 0.0f;          ///< same for the sole's lower end
         Mat3 pitch = kMat3Identity; ///< rotation of the target's foot that makes up for its length
     };
 
@@ -43,6 +44,8 @@ public:
 
     const Frame& At(size_t frame) const { return m_kFrames[frame]; }
     const LegLengths& Lengths() const { return m_kLengths; }
+    /// Returns how far the sole's toe end is below the target's ankle; 0 without a toe.
+    float ToeSole(size_t frame) const;
     /// Returns the vector from hip to ankle if thigh and calf point in the source's directions.
     Vec3 Stretch(size_t frame) const;
     /// Returns the bend of the source's knee, 0 to 1; see YieldKnee.h.

@@ -174,7 +174,7 @@ void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframe
     const Mat3 pelvis = above < 0 ? kMat3Identity : worldOf(static_cast<size_t>(above));
     const Mat3 thigh = PointedTo(knee, worldOf(leg.Thigh()), bones[leg.Calf()].translation);
     const Mat3 calf = PointedTo(ankle - knee, worldOf(leg.Calf()), bones[leg.Foot()].translation);
-    const Mat3 foot = worldOf(leg.Foot()) * leg.At(frame).pitch;
+    const Mat3 foot = worldOf(leg.Foot()) * leg.At(frame).pitch * plan_->ToeTurn(k, frame);
     tracks[leg.Thigh()]->m_kRotationKeys[frame] = QuatFromMat3(thigh * Mat3Transpose(pelvis));
     tracks[leg.Calf()]->m_kRotationKeys[frame] = QuatFromMat3(calf * Mat3Transpose(thigh));
     tracks[leg.Foot()]->m_kRotationKeys[frame] = QuatFromMat3(foot * Mat3Transpose(calf));

@@ -3,6 +3,7 @@
 #include "CNode.h"
 #include "Figures.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace gw {
@@ -11,6 +12,19 @@ namespace {
 
 // A foot that stands rolls over its ball more often than over its heel.
 constexpr double kFlatShare = 0.25;
+
+// A joint jumps if its step is longer than this, in leg lengths, and than this many times both steps around
+// it. The fastest kick accelerates over several frames.
+constexpr double kJumpStep = 0.15;
+constexpr double kJumpRatio = 5.0;
+
+bool JumpsAfter(const std::vector<Vec3>& path, size_t frame, double leg)
+{
+    const auto step = [&](size_t from) { return Vec3Length(path[from + 1] - path[from]); };
+    const double before = frame > 0 ? step(frame - 1) : 0.0;
+    const double after = frame + 2 < path.size() ? step(frame + 1) : 0.0;
+    return step(frame) > std::max({kJumpStep * leg, kJumpRatio * before, kJumpRatio * after});
+}
 
 } // namespace
 
@@ -60,6 +74,18 @@ std::vector<FootTouches> CSourceBody::Touches(double secondsPerFrame) const
     if (HasLegs())
         return m_kFeet.Touches(secondsPerFrame);
     return std::vector<FootTouches>(m_kLegs.size(), {{}, std::vector<float>(FrameCount(), 0.0f)});
+}
+
+std::vector<size_t> CSourceBody::Jumps() const
+{
+    std::vector<size_t> jumps;
+    for (size_t frame = 0; frame + 1 < FrameCount(); ++frame)
+    {
+        const auto jump = [&](const std::vector<Vec3>& path) { return JumpsAfter(path, frame, LegLength()); };
+        if (jump(m_kHips) || std::ranges::any_of(m_kFeet.Legs(), jump, &CLegTrack::Ankles))
+            jumps.push_back(frame);
+    }
+    return jumps;
 }
 
 float CSourceBody::FlatDrop(double secondsPerFrame) const

@@ -34,6 +34,10 @@ public:
     /// Returns the touches of each leg. They are empty, and nothing has landed, if the legs have no length.
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
+    /// Returns the frames after which the hips or an ankle jump: from a stance before the recording to its
+    /// start, for example, or from one take to the next.
+    std::vector<size_t> Jumps() const;
+
     /// Returns the height of the ankle above the toe in a foot that stands flat, measured while feet stand.
     float FlatDrop(double secondsPerFrame) const;
 

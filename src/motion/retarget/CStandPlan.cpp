@@ -9,12 +9,16 @@
 // the height of the hips makes up the difference: a smooth curve, fitted by least squares over all frames.
 // The ankles depend on that height, so the fit is iterated. Three rounds are enough, because each leaves only
 // a small part of the error it started with. The knee absorbs the rest, as far as it is bent and can do so
-// without a jerk (YieldKnee).
+// without a jerk (YieldKnee). What is then left between sole and floor is a few millimeters. A foot that is
+// pitched by a few degrees closes that gap with its toe, and the leg need not move. Where the foot stands is
+// then planned once more, because its toe has moved.
 
 #include "CStandPlan.h"
 
 #include "CBandFit.h"
+#include "Directions.h"
 #include "Figures.h"
+#include "FootPitch.h"
 #include "HoldFoot.h"
 #include "LandFoot.h"
 
@@ -32,6 +36,10 @@ constexpr double kRestWeight = 1e-4;    // weight of no lift at all; a standing 
 constexpr double kLiftLimit = 150.0;    // a source that needs more does not stand on a single floor
 constexpr double kMissed = 8.0;         // a standing foot whose sole is off by this much counts twice
 constexpr float kWristHeight = 30.0f;   // of a hand that is flat on the floor
+constexpr double kMostToeTurn = 0.08;   // radians; a toe end that is farther from the floor is left there
+constexpr double kToeReach = 10.0;      // beyond that, over which a toe end is pulled less and less
+constexpr double kToeWeight = 20.0;     // weight of a toe end on the floor; the foot's own pitch has weight 1
+constexpr double kToeHertz = 3.0;       // of the changes between the two
 constexpr double kLeastFirmness = 0.02; // minimum for any leg, however far its knee is bent
 
 double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
@@ -47,7 +55,7 @@ double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 
 CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, float lowestHand,
                        const Vec3& origin, double secondsPerFrame, bool holdFeet)
-    : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())),
+    : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())), m_kJumps(source.Jumps()),
       m_kRoots(source.FrameCount(), kVec3Zero), m_kLifts(source.FrameCount(), 0.0f)
 {
     const ContactsOfLegs contacts = source.Contacts(secondsPerFrame);
@@ -65,6 +73,11 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
     }
     for (int round = 0; round < kRounds; ++round)
         LiftRoot(secondsPerFrame);
+    for (size_t leg = 0; leg < legs_.size(); ++leg)
+    {
+        LowerToe(leg, secondsPerFrame);
+        HoldLeg(leg, touches[leg].contacts, secondsPerFrame);
+    }
 }
 
 // Returns the midpoint of the target's hip joints, relative to its root.
@@ -150,7 +163,7 @@ void CStandPlan::HoldLeg(size_t leg, const std::vector<Contact>& contacts, doubl
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
     {
         free.push_back(FreeAnkle(leg, frame));
-        toe.push_back(legs_[leg].At(frame).toe);
+        toe.push_back(Turned(legs_[leg].At(frame).toe, ToeTurn(leg, frame)));
     }
     const CLegTrack& track = source_.Leg(leg);
     const std::vector<Vec3> sourceAnkle = Scaled(track.Ankles());
@@ -158,7 +171,15 @@ void CStandPlan::HoldLeg(size_t leg, const std::vector<Contact>& contacts, doubl
     for (size_t frame = sourceToe.size(); frame < sourceAnkle.size(); ++frame)
         sourceToe.push_back(sourceAnkle[frame] + toe[frame]);
     const double length = legs_[leg].Lengths().upper + legs_[leg].Lengths().lower;
-    m_kAnkles.push_back(HoldFoot({free, toe, sourceAnkle, sourceToe, length}, contacts, secondsPerFrame));
+    const std::vector<Vec3> held =
+        HoldFoot({free, toe, sourceAnkle, sourceToe, length}, contacts, secondsPerFrame, m_kJumps);
+    if (leg == m_kAnkles.size())
+        m_kAnkles.push_back(held);
+    for (size_t frame = 0; frame < held.size(); ++frame)
+    {
+        m_kAnkles[leg][frame].x = held[frame].x;
+        m_kAnkles[leg][frame].z = held[frame].z;
+    }
 }
 
 void CStandPlan::LandLeg(size_t leg, const std::vector<float>& landed, double secondsPerFrame)
@@ -181,8 +202,8 @@ void CStandPlan::AddWish(size_t leg, size_t frame, CBandFit& lifts) const
     const Vec3 way = m_kAnkles[leg][frame] - m_kRoots[frame] - legs_[leg].At(frame).hip;
     const double distance = Vec3Length(way);
     const double bend = legs_[leg].KneeBend(frame);
-    const double yielded = YieldingBend(lengths, distance, bend, kLimbStiffness);
-    const double slope = SquareSlopeAt(lengths, 0.5 * (bend + yielded)) / (kLimbStiffness * kLimbStiffness);
+    const double yielded = YieldingBend(lengths, distance, bend, kKneeStiffness);
+    const double slope = SquareSlopeAt(lengths, 0.5 * (bend + yielded)) / (kKneeStiffness * kKneeStiffness);
     const double missed =
         static_cast<double>(m_kLanded[leg][frame]) * (distance - ReachAt(lengths, yielded)) / kMissed;
     const double firmness = kLeastFirmness + (1.0 + missed * missed) / (1.0 + slope);
@@ -208,6 +229,37 @@ void CStandPlan::LiftRoot(double secondsPerFrame)
     }
 }
 
+// The toe end of a sole should be on the floor if it is near it. If the heel is deeper, the toe end should at
+// least not be below it.
+double CStandPlan::WantedToeDrop(size_t leg, size_t frame) const
+{
+    const CFaithfulLeg::Frame& at = legs_[leg].At(frame);
+    const auto ankle = static_cast<double>(m_kRoots[frame].y + at.hip.y + Ankle(leg, frame).y);
+    const auto heel = static_cast<double>(at.heel);
+    const auto toe = static_cast<double>(legs_[leg].ToeSole(frame));
+    const double drop = (ankle >= heel ? ankle : std::min(toe, heel)) - toe;
+    const double most = kMostToeTurn * ToePlaceOf(at.toe).ahead;
+    return drop * (1.0 - Smoothstep((std::fabs(drop) - most) / (most + kToeReach)));
+}
+
+void CStandPlan::LowerToe(size_t leg, double secondsPerFrame)
+{
+    CBandFit drops(m_kRoots.size(), BendWeight(kToeHertz, secondsPerFrame), 1.0);
+    for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
+    {
+        const auto landed = static_cast<double>(m_kLanded[leg][frame]);
+        if (landed > 0.0)
+            drops.AddValue(frame, kToeWeight * landed, WantedToeDrop(leg, frame));
+    }
+    m_kToeDrops.push_back(drops.Solve());
+}
+
+Mat3 CStandPlan::ToeTurn(size_t leg, size_t frame) const
+{
+    return leg < m_kToeDrops.size() ? LoweredToe(legs_[leg].At(frame).toe, m_kToeDrops[leg][frame])
+                                    : kMat3Identity;
+}
+
 Vec3 CStandPlan::Ankle(size_t leg, size_t frame) const
 {
     if (m_kAnkles.empty())
@@ -215,7 +267,7 @@ Vec3 CStandPlan::Ankle(size_t leg, size_t frame) const
     const Vec3 asked = m_kAnkles[leg][frame] - m_kRoots[frame] - legs_[leg].At(frame).hip;
     const double distance = Vec3Length(asked);
     const LegLengths& lengths = legs_[leg].Lengths();
-    const double bend = YieldingBend(lengths, distance, legs_[leg].KneeBend(frame), kLimbStiffness);
+    const double bend = YieldingBend(lengths, distance, legs_[leg].KneeBend(frame), kKneeStiffness);
     return asked * static_cast<float>(ReachAt(lengths, bend) / distance);
 }
 

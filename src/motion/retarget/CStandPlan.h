@@ -25,6 +25,8 @@ public:
     const Vec3& Root(size_t frame) const { return m_kRoots[frame]; }
     /// Returns the ankle relative to the hip of the same leg; it is always within the leg's reach.
     Vec3 Ankle(size_t leg, size_t frame) const;
+    /// Returns a rotation by a few degrees that brings the toe end of a foot's sole to the floor.
+    Mat3 ToeTurn(size_t leg, size_t frame) const;
     /// Converts a position of the source to the target's scale and floor height. The horizontal position is
     /// only scaled, not moved to where the target is.
     Vec3 OnTarget(const Vec3& place) const;
@@ -43,18 +45,22 @@ private:
     void HoldLeg(size_t leg, const std::vector<Contact>& contacts, double secondsPerFrame);
     void LandLeg(size_t leg, const std::vector<float>& landed, double secondsPerFrame);
     void AddWish(size_t leg, size_t frame, CBandFit& lifts) const;
+    double WantedToeDrop(size_t leg, size_t frame) const;
+    void LowerToe(size_t leg, double secondsPerFrame);
     void LiftRoot(double secondsPerFrame);
     std::vector<Vec3> Scaled(const std::vector<Vec3>& places) const;
 
     const std::vector<CFaithfulLeg>& legs_;
     const CSourceBody& source_;
-    double m_fScale; // target lengths / source lengths
+    double m_fScale;              // target lengths / source lengths
+    std::vector<size_t> m_kJumps; // frames after which the source jumps
     bool m_bHasFloor = false;
     float m_fRaised = 0.0f; // what to add to the scaled source's heights to put it on the target's floor
     std::vector<Vec3> m_kRoots;
-    std::vector<float> m_kLifts;               // the part of the roots' heights that was added for the legs
-    std::vector<std::vector<Vec3>> m_kAnkles;  // by leg and frame; empty if feet are not held
-    std::vector<std::vector<float>> m_kLanded; // confidence that a sole is on the floor
+    std::vector<float> m_kLifts;              // the part of the roots' heights that was added for the legs
+    std::vector<std::vector<Vec3>> m_kAnkles; // by leg and frame; empty if feet are not held
+    std::vector<std::vector<double>> m_kToeDrops; // relative to the ankle; empty until they are planned
+    std::vector<std::vector<float>> m_kLanded;    // confidence that a sole is on the floor
 };
 
 } // namespace gw

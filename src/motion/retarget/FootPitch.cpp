@@ -23,7 +23,7 @@ namespace {
 
 constexpr double kMostPitch = 0.15;  // radians; more would look like another foot
 constexpr double kUpright = 0.5;     // a foot whose horizontal part is a smaller share of it pitches less
-constexpr double kAheadWeight = 0.3; // weight of the distance ahead against the height
+constexpr double kAheadWeight = 0.5; // weight of the distance ahead against the height
 
 } // namespace
 
@@ -47,6 +47,17 @@ Mat3 PitchFoot(const Vec3& toe, const ToePlace& wanted)
     const double pitch = present + most * std::tanh(turn / kMostPitch);
     const auto scale = static_cast<float>(std::cos(pitch) * length / place.ahead);
     return LeastSwing(toe, {toe.x * scale, static_cast<float>(std::sin(pitch) * length), toe.z * scale});
+}
+
+Mat3 LoweredToe(const Vec3& toe, double drop)
+{
+    const ToePlace place = ToePlaceOf(toe);
+    const double length = std::hypot(place.ahead, place.height);
+    const double height = std::clamp(place.height - drop, -0.99 * length, 0.99 * length);
+    const auto scale = static_cast<float>(std::sqrt(length * length - height * height) / place.ahead);
+    if (!std::isfinite(scale))
+        return kMat3Identity;
+    return LeastSwing(toe, {toe.x * scale, static_cast<float>(height), toe.z * scale});
 }
 
 } // namespace gw

@@ -19,4 +19,8 @@ ToePlace ToePlaceOf(const Vec3& ankleToToe);
 /// `toe` is the vector from its ankle to its toe. Returns the identity if `wanted` is not finite.
 Mat3 PitchFoot(const Vec3& toe, const ToePlace& wanted);
 
+/// Returns a rotation that lowers the toe of a foot by `drop`, relative to its ankle; the identity if it is
+/// not finite.
+Mat3 LoweredToe(const Vec3& toe, double drop);
+
 } // namespace gw

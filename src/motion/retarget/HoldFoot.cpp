@@ -35,7 +35,7 @@ namespace {
 // In leg lengths per second.
 
 constexpr double kStillSpeed = 0.12; // of a foot that certainly stands
-constexpr double kDriftSpeed = 0.4;  // of a foot that moves instead of drifting
+constexpr double kDriftSpeed = 0.15; // of a foot that moves instead of drifting
 
 constexpr double kSpeedBlend = 0.03;  // seconds over which the speeds that set the pivot are smoothed
 constexpr double kDriftShare = 0.03;  // in leg lengths: half of a drift this long is kept
@@ -48,14 +48,16 @@ Vec3 Between(const Vec3& a, const Vec3& b, double share)
     return a + (b - a) * static_cast<float>(share);
 }
 
-// Returns the smoothed speed of a joint in each frame, in leg lengths per second.
-std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secondsPerFrame)
+// Returns the smoothed speed of a joint in each frame, in leg lengths per second. A jump has no speed.
+std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secondsPerFrame,
+                            std::span<const size_t> jumps)
 {
+    const auto isApart = [&](size_t frame) { return std::ranges::binary_search(jumps, frame); };
     std::vector<float> speeds;
     for (size_t frame = 0; frame < path.size(); ++frame)
     {
-        const size_t before = frame > 0 ? frame - 1 : 0;
-        const size_t after = std::min(frame + 1, path.size() - 1);
+        const size_t before = frame > 0 && !isApart(frame - 1) ? frame - 1 : frame;
+        const size_t after = frame + 1 < path.size() && !isApart(frame) ? frame + 1 : frame;
         const double seconds = static_cast<double>(std::max<size_t>(after - before, 1)) * secondsPerFrame;
         const double speed = Vec3Length(path[after] - path[before]) / (seconds * leg);
         speeds.push_back(std::isfinite(speed) ? static_cast<float>(speed) : 0.0f);
@@ -68,9 +70,9 @@ std::vector<float> SpeedsOf(std::span<const Vec3> path, double leg, double secon
 class CPivot
 {
 public:
-    CPivot(const FootPaths& foot, double secondsPerFrame)
-        : foot_(foot), m_kAnkle(SpeedsOf(foot.sourceAnkle, foot.leg, secondsPerFrame)),
-          m_kToe(SpeedsOf(foot.sourceToe, foot.leg, secondsPerFrame))
+    CPivot(const FootPaths& foot, double secondsPerFrame, std::span<const size_t> jumps)
+        : foot_(foot), m_kAnkle(SpeedsOf(foot.sourceAnkle, foot.leg, secondsPerFrame, jumps)),
+          m_kToe(SpeedsOf(foot.sourceToe, foot.leg, secondsPerFrame, jumps))
     {
     }
     /// Returns where the pivot is between a frame and the next: 0 at the ankle, 1 at the toe. `still` is e.
@@ -146,9 +148,10 @@ Vec3 Lost(const Vec3& from, const Vec3& to, double leg, double secondsPerFrame)
 
 } // namespace
 
-std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame)
+std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame,
+                           std::span<const size_t> jumps)
 {
-    const CPivot pivot(foot, secondsPerFrame);
+    const CPivot pivot(foot, secondsPerFrame, jumps);
     const double bend = BendWeight(kReturnHertz, secondsPerFrame);
     const double stepWeight = std::pow(kHoldSeconds / secondsPerFrame, 2.0);
     const double shakeWeight = stepWeight * std::pow(kTwoPi64 * kShakeHertz * secondsPerFrame, -2.0);

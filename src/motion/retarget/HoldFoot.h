@@ -3,6 +3,7 @@
 #include "FindContacts.h"
 #include "Vec3.h"
 
+#include <cstddef>
 #include <span>
 #include <vector>
 
@@ -20,7 +21,9 @@ struct FootPaths
 
 /// Returns the ankle's path, one position per frame. In the frames of the contacts, x and z are such that the
 /// foot stands still, and rolls over its toe when the source's foot does. Outside of contacts, the ankle
-/// returns to its free path. y is always that of the free path.
-std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame);
+/// returns to its free path. y is always that of the free path. The source may jump after the frames `jumps`,
+/// which are in order.
+std::vector<Vec3> HoldFoot(const FootPaths& foot, std::span<const Contact> contacts, double secondsPerFrame,
+                           std::span<const size_t> jumps = {});
 
 } // namespace gw

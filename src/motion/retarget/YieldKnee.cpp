@@ -11,7 +11,8 @@
 // The result is the exact angle where |r'| is large, and changes evenly where it is not. A knee that
 // straightens is slowed down in its last degrees, so it approaches its stop and never hits it. The equation
 // is integrated with Heun's method in a few steps, which is enough because bends are small and the right-hand
-// side is smooth.
+// side is smooth. A knee that bends far is a few millimeters short, because it started where |r'| was small.
+// It is then moved toward the exact angle, and the more so the larger |r'| is there.
 //
 // With y = sin(x / 2) instead of the angle, and a and b for the segments, the law of cosines becomes
 //
@@ -29,8 +30,9 @@ namespace gw {
 namespace {
 
 constexpr int kSteps = 4;
-constexpr double kStopBend = 0.06;   // a knee slows down in the last 7 degrees before its stop
-constexpr double kLeastBend = 0.005; // below this, rounding dominates
+constexpr double kStopBend = 0.06;    // a knee slows down in the last 7 degrees before its stop
+constexpr double kLeastBend = 0.005;  // below this, rounding dominates
+constexpr double kExactSlope = 150.0; // millimeters per radian; a knee of 50 degrees is half exact
 constexpr double kMostBend = 0.9999;
 
 // Returns the change of the bend per unit of length in `direction`: 1 shortens the leg, -1 straightens it.
@@ -82,6 +84,8 @@ double YieldingBend(const LegLengths& leg, double asked, double bend, double sti
         const double second = BendFor(leg, ahead, slowBelow, stiffness, direction);
         taken = std::clamp(taken + 0.5 * step * (first + second), 0.0, kMostBend);
     }
+    const double slope = SquareSlopeAt(leg, taken);
+    taken += slope / (slope + kExactSlope * kExactSlope) * (BendAt(leg, asked) - taken);
     return std::sqrt(taken * taken + kLeastBend * kLeastBend);
 }
 

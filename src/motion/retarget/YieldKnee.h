@@ -11,9 +11,11 @@ struct LegLengths
 
 // The bend of a knee is the sine of half its angle: 0 for a straight leg, 1 for a folded one.
 
-/// Stiffness of the target's knees and elbows, in millimeters per radian: they rotate by at most 1.3 degrees
-/// per millimeter.
-inline constexpr double kLimbStiffness = 45.0;
+/// Stiffness of the target's knees, in millimeters per radian: they rotate by at most 0.8 degrees per
+/// millimeter.
+inline constexpr double kKneeStiffness = 75.0;
+/// Same for its elbows, which a viewer watches less.
+inline constexpr double kElbowStiffness = 45.0;
 
 /// Returns the distance between hip and ankle at a given bend.
 double ReachAt(const LegLengths& leg, double bend);
