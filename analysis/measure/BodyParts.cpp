@@ -25,6 +25,13 @@ constexpr BodyPart kParts[] = {
     {"neck",      kNeck     },
     {"head",      kHead     },
 };
+constexpr size_t kLimbParts = 4; // the first of them
+
+bool IsInAny(std::span<const BodyPart> parts, std::string_view target)
+{
+    return std::ranges::any_of(
+        parts, [=](const BodyPart& part) { return std::ranges::count(part.bones, target) != 0; });
+}
 
 } // namespace
 
@@ -35,8 +42,12 @@ std::span<const BodyPart> BodyParts()
 
 bool IsMainBone(std::string_view target)
 {
-    return std::ranges::any_of(
-        kParts, [=](const BodyPart& part) { return std::ranges::count(part.bones, target) != 0; });
+    return IsInAny(kParts, target);
+}
+
+bool IsLimb(std::string_view target)
+{
+    return IsInAny(std::span(kParts).first(kLimbParts), target);
 }
 
 } // namespace gw

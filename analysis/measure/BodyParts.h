@@ -19,4 +19,7 @@ std::span<const BodyPart> BodyParts();
 /// Returns whether a target bone belongs to one of the parts, that is, is a main bone.
 bool IsMainBone(std::string_view target);
 
+/// Returns whether a target bone is an upper arm, a forearm, a thigh or a calf.
+bool IsLimb(std::string_view target);
+
 } // namespace gw

@@ -1,5 +1,6 @@
 #include "BoneEnds.h"
 
+#include "BodyParts.h"
 #include "BodyTree.h"
 #include "BonePairs.h"
 #include "CPoseSampler.h"
@@ -65,7 +66,11 @@ BoneEnds FindBoneEnds(const BonePair& pair, const CSourceTable& sources)
     CNode* const next = NextMapped(*pair.target, sources);
     CNode* const sourceNext = sources.SourceOf(next);
     CNode* const start = SourceStart(*pair.source, sourceNext);
-    return {JointBelow(*pair.target, next), JointBelow(*start, sourceNext), start};
+    const BoneEnds ends{JointBelow(*pair.target, next), JointBelow(*start, sourceNext), start};
+    // A viewer sees a thigh from hip to knee. A twist joint in between may be off that line.
+    const bool skipsTwists = IsLimb(pair.target->NameView()) && next && ends.target == next && ends.source &&
+                             IsAtOrBelow(sourceNext, ends.source);
+    return skipsTwists ? BoneEnds{next, sourceNext, start} : ends;
 }
 
 } // namespace gw

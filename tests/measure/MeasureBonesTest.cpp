@@ -21,8 +21,11 @@ TEST(MeasureConversion, DirectionLeadsToTheNextJointThatIsAwayAlongTheBody)
     source.AddBone("Twist", "Helper", {0.0f, 0.0f, 0.0f});
     source.AddBone("Wrist", "Twist", {250.0f, 0.0f, 0.0f});
     source.Remove("LHand");
+    source.AddBone("ThighTwist", "LThigh", {20.0f, -200.0f, 0.0f});
+    source.AddBone("Knee", "ThighTwist", {-20.0f, -200.0f, 0.0f});
     std::vector<BonePair> pairs = PairByName(source, result);
     pairs.push_back({&result.Bone("LHand"), &source.Bone("Wrist")});
+    std::ranges::find(pairs, &result.Bone("LCalf"), &BonePair::target)->source = &source.Bone("Knee");
     for (BonePair& pair : pairs)
     {
         if (pair.target == &result.Bone("UpperTorso"))
@@ -37,6 +40,7 @@ TEST(MeasureConversion, DirectionLeadsToTheNextJointThatIsAwayAlongTheBody)
         {"a hip leads along its spine", "LowerTorso", "UpperTorso", "UpperTorso"},
         {"a collar that drives a torso is measured as a torso", "UpperTorso", "Neck", "Neck"},
         {"helpers at one place are passed", "LForearm", "LHand", "Wrist"},
+        {"a limb leads past a twist joint", "LThigh", "LCalf", "Knee"},
         {"a foot leads to its toe", "LFoot", "LToe", "LToe"},
         {"an end joint leads nowhere", "Head", "", ""},
     };
