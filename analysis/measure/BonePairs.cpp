@@ -24,11 +24,18 @@ bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* res
                    std::vector<BonePair>& pairs, std::vector<MissingBone>& missing)
 {
     std::string text;
-    if (!ReadProfileText(profilePath, text))
-        return false;
+    const bool isRead = ReadProfileText(profilePath, text);
+    if (isRead)
+        PairBones(text, sourceRoot, resultRoot, pairs, missing);
+    return isRead;
+}
+
+void PairBones(std::string_view profileText, CNode* sourceRoot, CNode* resultRoot,
+               std::vector<BonePair>& pairs, std::vector<MissingBone>& missing)
+{
     const CBoneNames sources(sourceRoot);
     const CBoneNames targets(resultRoot);
-    CProfileReader reader(text);
+    CProfileReader reader(profileText);
     for (ProfileLine line; reader.Next(line);)
     {
         if (line.kind != EProfileLine::Mapping)
@@ -41,7 +48,6 @@ bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* res
         else
             missing.push_back({ESkeletonSide::Target, std::string(line.target), {}, 0, line.line});
     }
-    return true;
 }
 
 CSourceTable::CSourceTable(std::span<const BonePair> pairs)

@@ -4,6 +4,7 @@
 
 #include <span>
 #include <string>
+#include <string_view>
 #include <unordered_map>
 #include <vector>
 
@@ -23,6 +24,9 @@ struct BonePair
 /// false, changing nothing, if the profile cannot be read.
 bool ReadBonePairs(const std::string& profilePath, CNode* sourceRoot, CNode* resultRoot,
                    std::vector<BonePair>& pairs, std::vector<MissingBone>& missing);
+/// Same for the text of a profile.
+void PairBones(std::string_view profileText, CNode* sourceRoot, CNode* resultRoot,
+               std::vector<BonePair>& pairs, std::vector<MissingBone>& missing);
 
 /// Maps targets to their sources.
 class CSourceTable

@@ -1,19 +1,11 @@
 #pragma once
 
-#include "ConversionDetail.h"
-#include "ConversionMeasures.h"
 #include "MeasureConversion.h"
+#include "MeasuredConversion.h"
 
 #include <string>
 
 namespace gw {
-
-/// All measures of a conversion.
-struct MeasuredConversion
-{
-    ConversionMeasures sums;
-    ConversionDetail detail;
-};
 
 /// A conversion to be shown on a page. Referenced objects must outlive it.
 struct ConvertedMotion

@@ -3,12 +3,10 @@
 #include "CFileConversion.h"
 
 #include "AlignMotion.h"
-#include "AttachBoneMeshes.h"
 #include "CProfileFields.h"
 #include "CResourceManager.h"
 #include "FindBone.h"
 #include "FindingWords.h"
-#include "GlbFile.h"
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "ResultFile.h"
@@ -25,8 +23,6 @@ CFileConversion::CFileConversion(const std::string& dataFolder, const Conversion
                                  NoticeListener listener)
     : platform_(EPlatformWriting::No, dataFolder), choices_(choices), notify_(std::move(listener))
 {
-    // Only the source's: the target's lowest point is put on the floor.
-    motion_.boneMeshes = EBoneMeshes::Empty;
 }
 
 std::string CFileConversion::Message(int id) const
@@ -47,31 +43,18 @@ bool CFileConversion::LoadSource(const std::string& path, const std::string& cop
 {
     sourcePath_ = path;
     sourceNames_.reset();
-    const std::string& file = copy.empty() ? path : copy;
-    isScene_ = HasExtension(file, kSceneExtension);
-    const bool loaded = isScene_ ? LoadSourceScene(file, scene_, sourceRecord_) : motion_.Load(file);
-    if (!isScene_)
-        sourceRecord_ = motion_.Record();
-    else if (loaded)
-        AttachBoneMeshes(
-            SourceRoot()); // as for motion files, because bone meshes define the bones' directions
-    Notify(path, sourceRecord_);
-    if (!loaded)
+    const bool isLoaded = source_->Load(copy.empty() ? path : copy);
+    Notify(path, source_->Record());
+    if (!isLoaded)
         TellMessage(kInvalidSourceMessage);
-    else if (rate_ > 0.0f)
-        SetFrameTime(*SourceRoot(), 1.0f / rate_);
-    return loaded;
+    return isLoaded;
 }
 
-void CFileConversion::SelectSource(const std::string& clip, float rate)
+void CFileConversion::UseSource(const std::string& path, std::shared_ptr<CSourceMotion> source)
 {
-    motion_.importChoice = {clip, rate};
-    rate_ = rate;
-}
-
-CNode* CFileConversion::SourceRoot() const
-{
-    return isScene_ ? FirstNode(scene_.GetRoot(0)) : motion_.motionRoot.Get();
+    sourcePath_ = path;
+    sourceNames_.reset();
+    source_ = std::move(source);
 }
 
 const CBoneNames& CFileConversion::SourceNames()
@@ -82,11 +65,6 @@ const CBoneNames& CFileConversion::SourceNames()
 const CBoneNames& CFileConversion::TargetNames()
 {
     return targetNames_ ? *targetNames_ : targetNames_.emplace(result_.motionRoot.Get());
-}
-
-SourceTiming CFileConversion::Timing() const
-{
-    return isScene_ ? TimingOf(ConversionTrack(SourceRoot())) : TimingOf(motion_);
 }
 
 bool CFileConversion::LoadTarget()
@@ -115,10 +93,9 @@ void CFileConversion::UseProfile(const std::string& path, const ProfileRows& pro
     profilePath_ = path;
 }
 
-// A container can claim to end before it begins.
 bool CFileConversion::HasFrames() const
 {
-    const bool hasFrames = (isScene_ || motion_.GetKeyCount() > 0) && result_.GetKeyCount() > 0;
+    const bool hasFrames = source_->HasFrames() && result_.GetKeyCount() > 0;
     if (!hasFrames)
         Notify(MakeNotice(sourcePath_, {EFailure::NothingToConvert}));
     return hasFrames;
@@ -163,7 +140,7 @@ bool CFileConversion::Prepare(EAlignedJoints joints)
     conversion_.emplace(ConversionInput{.sourcePath = sourcePath_,
                                         .source = source,
                                         .timing = Timing(),
-                                        .sourceRecord = sourceRecord_,
+                                        .sourceRecord = source_->Record(),
                                         .profilePath = profilePath_,
                                         .profileName = profile_.name,
                                         .rows = profile_.rows,
@@ -192,16 +169,9 @@ bool CFileConversion::WriteResult(const std::string& path, bool* taken)
 
 bool CFileConversion::WriteExchange(const std::string& path, bool* taken)
 {
-    constexpr double kMetersPerUnit = 0.001; // of the host skeleton
-    if (HasExtension(path, ".glb"))
-    {
-        CFailureRecord record;
-        SaveGlb(result_, kMetersPerUnit, path, record);
-        return TellWritten(path, record, taken);
-    }
-    TKBVHStream stream(result_);
-    stream.WriteExact(path);
-    return TellWritten(path, stream.Record(), taken);
+    CFailureRecord record;
+    WriteExchangeFile(result_, path, record);
+    return TellWritten(path, record, taken);
 }
 
 // Reports the end of writing.

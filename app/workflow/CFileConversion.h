@@ -3,12 +3,13 @@
 #include "CConversion.h"
 #include "CFilePlatform.h"
 #include "CMotionFile.h"
-#include "COrrinStream.h"
 #include "CRetargeter.h"
+#include "CSourceMotion.h"
 #include "EditMotion.h"
 #include "FindBone.h"
 #include "ProfileRows.h"
 
+#include <memory>
 #include <optional>
 #include <string>
 
@@ -30,7 +31,10 @@ public:
     bool LoadSource(const std::string& path, const std::string& copy = {});
     /// Selects what LoadSource reads: the clip of a file with several, and the rate, in frames per second, in
     /// place of the file's own; 0 for that.
-    void SelectSource(const std::string& clip, float rate);
+    void SelectSource(const std::string& clip, float rate) { source_->Select(clip, rate); }
+    /// Uses a source that has been read already, in place of LoadSource. Nothing else may use it until the
+    /// conversion is finished.
+    void UseSource(const std::string& path, std::shared_ptr<CSourceMotion> source);
     /// Reads the base skeleton. Each conversion needs a new one.
     bool LoadTarget();
     bool UseProfile(const std::string& path);
@@ -54,11 +58,11 @@ public:
     /// the option `align`.
     bool WriteAligned(const std::string& path);
 
-    CNode* SourceRoot() const;
+    CNode* SourceRoot() const { return source_->Root(); }
     /// Returns the names of the source's and the target's bones, listed when first needed.
     const CBoneNames& SourceNames();
     const CBoneNames& TargetNames();
-    SourceTiming Timing() const;
+    SourceTiming Timing() const { return source_->Timing(); }
     /// Returns what drove the last conversion: the source, or its aligned copy.
     CNode* DrivingRoot() const;
     /// Returns the target, or the result after Convert.
@@ -92,11 +96,7 @@ private:
     ConversionChoices choices_;
     NoticeListener notify_;
     std::string sourcePath_;
-    float rate_ = 0.0f;
-    bool isScene_ = false; // the source is the scene below, not the motion
-    COrrinStream scene_;
-    CMotionFile motion_;
-    CFailureRecord sourceRecord_;
+    std::shared_ptr<CSourceMotion> source_ = std::make_shared<CSourceMotion>();
     CMotionFile result_;
     ProfileRows profile_;
     std::string profilePath_;

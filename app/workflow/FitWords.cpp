@@ -72,4 +72,12 @@ Notice MisfitNotice(const std::string& source, const CProfileFit& fit)
     return MakeNotice(source, "misfit", summary + '\n' + lines);
 }
 
+Notice NoneFitsNotice(const std::string& source, const CProfileFit& nearest)
+{
+    Notice notice = MisfitNotice(source, nearest);
+    notice.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
+                                         : "no installed profile fits; the closest is " + notice.words;
+    return notice;
+}
+
 } // namespace gw

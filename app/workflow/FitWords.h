@@ -16,5 +16,8 @@ std::string FitSummary(const CProfileFit& fit);
 std::string MissingLines(const CProfileFit& fit);
 /// Returns why a profile does not fit a source; the notice's code is "misfit".
 Notice MisfitNotice(const std::string& source, const CProfileFit& fit);
+/// Returns the notice that no installed profile fits a source. It names the closest one; if `nearest` has no
+/// rows, it says that none is installed.
+Notice NoneFitsNotice(const std::string& source, const CProfileFit& nearest);
 
 } // namespace gw

@@ -5,8 +5,10 @@
 #include "CByteSink.h"
 #include "CMotionFile.h"
 #include "CPackageFile.h"
+#include "GlbFile.h"
 #include "Packaging.h"
 #include "Paths.h"
+#include "TKBVHStream.h"
 
 #include <functional>
 
@@ -58,6 +60,17 @@ bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, i
 {
     const auto write = [&](float frameScale) { return result.Save(path, frameScale); };
     return SaveMotion(result, rate, profileRate, write, record);
+}
+
+bool WriteExchangeFile(const CMotionFile& result, const std::string& path, CFailureRecord& record)
+{
+    constexpr double kMetersPerUnit = 0.001; // of the host skeleton
+    if (HasExtension(path, ".glb"))
+        return SaveGlb(result, kMetersPerUnit, path, record);
+    TKBVHStream stream(result);
+    const bool written = stream.WriteExact(path);
+    record = stream.Record();
+    return written;
 }
 
 bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record)

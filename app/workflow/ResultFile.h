@@ -43,6 +43,8 @@ bool WriteResultFile(CMotionFile& result, const std::string& path, int profileRa
 /// Writes a result as HTR with rate / profileRate times as many frames.
 bool WriteMotionFile(CMotionFile& result, const std::string& path, float rate, int profileRate,
                      CFailureRecord& record);
+/// Writes a result, with all frames at the source's rate, as .glb or, for any other extension, as .bvh.
+bool WriteExchangeFile(const CMotionFile& result, const std::string& path, CFailureRecord& record);
 /// Packages an HTR file like a batch run.
 bool PackageMotionFile(const std::string& path, const std::string& output, CFailureRecord& record);
 

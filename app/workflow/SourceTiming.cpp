@@ -39,10 +39,12 @@ SourceTiming TimingOf(const CKeyframeControl* track)
 
 // Reads into a separate scene, because a damaged file must not change the current one.
 bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record,
-                     std::function<void(size_t, size_t)> progress)
+                     std::function<void(size_t, size_t)> progress, EPictures pictures)
 {
     COrrinStream stream;
     stream.SetProgress(std::move(progress));
+    if (pictures == EPictures::Named)
+        stream.SetPictureLimit(0);
     const bool read = stream.LoadFile(path, false);
     record = stream.Record();
     if (read && !record.Failure() && !PreviewTrack(FirstNode(stream.GetRoot(0))))

@@ -1,5 +1,6 @@
 #pragma once
 
+#include <cstdint>
 #include <functional>
 #include <string>
 #include <string_view>
@@ -30,11 +31,19 @@ SourceTiming TimingOf(const CKeyframeControl* track);
 /// The extension of a source that is a container.
 inline constexpr std::string_view kSceneExtension = ".orn";
 
+/// Whether the files of linked pictures are read.
+enum class EPictures : uint8_t
+{
+    Read,
+    Named, ///< only their names are kept
+};
+
 /// Reads a container with keys for a conversion. If it is damaged or has none, records the failure, leaves
 /// the scene unchanged and returns false. `progress` is called with the number of bytes read and the total;
 /// it may throw to end the reading, which leaves the scene unchanged too.
 bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record,
-                     std::function<void(size_t, size_t)> progress = {});
+                     std::function<void(size_t, size_t)> progress = {},
+                     EPictures pictures = EPictures::Read);
 
 /// Returns the first plain node under a container's root, or null.
 CNode* FirstNode(CObject* root);

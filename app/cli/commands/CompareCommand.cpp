@@ -11,6 +11,7 @@
 #include "CommandTable.h"
 #include "CompareText.h"
 #include "ConvertedMotion.h"
+#include "MeasureResult.h"
 #include "PackagedMotion.h"
 #include "PageOutput.h"
 #include "Paths.h"

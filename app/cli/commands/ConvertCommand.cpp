@@ -9,6 +9,7 @@
 #include "Output.h"
 #include "PageOutput.h"
 #include "Paths.h"
+#include "ResultExtension.h"
 #include "RunSetup.h"
 #include "Streams.h"
 #include "Text.h"

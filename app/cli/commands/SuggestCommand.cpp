@@ -24,8 +24,6 @@ namespace gw {
 
 namespace {
 
-constexpr const char* kSurenessWords[] = {"sure", "likely", "unsure"};
-
 constexpr const char* kEvidenceWords[] = {
     "no evidence",
     "by shape; the name gives no hint",
@@ -33,10 +31,6 @@ constexpr const char* kEvidenceWords[] = {
     "by name; the shape gives no hint",
     "by name and shape",
 };
-constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
-
-constexpr const char* kKindCodes[] = {"turned", "neutral", "fixed", "no-source", "no-name"};
-
 template <class Enum, size_t count>
 const char* Text(const char* const (&words)[count], Enum value)
 {
@@ -57,7 +51,7 @@ std::string Reason(const SuggestedRow& row, const SuggestedProfile& profile)
         break;
     }
     std::string reason =
-        std::string(Text(kSurenessWords, row.sureness)) + ": " + Text(kEvidenceWords, row.evidence);
+        std::string(RowSurenessName(row.sureness)) + ": " + Text(kEvidenceWords, row.evidence);
     for (const EDoubt doubt : row.doubts)
         reason += std::string("; ") + DoubtPhrase(doubt);
     if (row.nudged)
@@ -96,13 +90,13 @@ void WriteRow(CJsonWriter& json, const SuggestedRow& row)
     json.Key("target").Text(row.target);
     json.Key("source").Text(row.source ? row.source->NameView() : "");
     json.Key("joint").Text(row.kind == ESuggestedRow::Fixed ? "" : PlaceWords(row.place));
-    json.Key("kind").Text(Text(kKindCodes, row.kind));
+    json.Key("kind").Text(RowKindCode(row.kind));
     if (row.IsMapping())
     {
         WriteNumbers(json, "rotation", row.numbers.rotation);
         WriteNumbers(json, "axes", row.numbers.axes);
-        json.Key("sureness").Text(Text(kSurenessWords, row.sureness));
-        json.Key("evidence").Text(Text(kEvidenceCodes, row.evidence));
+        json.Key("sureness").Text(RowSurenessName(row.sureness));
+        json.Key("evidence").Text(EvidenceCode(row.evidence));
         json.Key("doubts").BeginArray();
         for (const EDoubt doubt : row.doubts)
             json.Text(DoubtCode(doubt));

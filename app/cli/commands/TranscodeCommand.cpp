@@ -1,21 +1,14 @@
-#include "BodyPaths.h"
 #include "CMotionFile.h"
 #include "COutputFile.h"
 #include "CommandTable.h"
-#include "FindBody.h"
-#include "GlbFile.h"
-#include "MotionFacts.h"
 #include "Notice.h"
 #include "Output.h"
 #include "PackagedMotion.h"
 #include "Paths.h"
 #include "Streams.h"
-#include "TKBVHStream.h"
 #include "Text.h"
-#include "UpAxis.h"
+#include "TranscodeFile.h"
 #include "Words.h"
-
-#include <cmath>
 
 namespace gw {
 
@@ -60,40 +53,6 @@ bool CanTranscode(const ShellOptions& options)
     return false;
 }
 
-// A .bvh is written without the last frame, and its frame time has six decimals.
-const char* WhyNoBVH(const CMotionFile& motion)
-{
-    constexpr float kLeastFrameTime = 0.0000005f;
-    if (motion.GetLastFrame() <= -1.0f)
-        return "the motion has no frames, so there is nothing to write";
-    if (!(motion.GetFrequency() >= kLeastFrameTime) || !std::isfinite(motion.GetFrequency()))
-        return "the frame time is 0, or too small for the six digits of a .bvh, so the rate would be lost";
-    return nullptr;
-}
-
-// The file's own unit, or the one that the body's legs suggest.
-double MetersPerUnit(const CMotionFile& motion)
-{
-    const double unit = motion.imported.unitMeters;
-    return unit > 0.0 ? unit : MetersOfUnit(RestLegLength(FindBody(*motion.motionRoot).body));
-}
-
-Vec3 UpAxisOf(const CMotionFile& motion)
-{
-    return FindUpAxis(FindBody(*motion.motionRoot).body, motion.GetFrequency(), motion.GetKeyCount());
-}
-
-// Writes the file by its extension. If that fails, records the reason and returns false.
-bool Write(const ShellOptions& options, CMotionFile& motion, const std::string& path, CFailureRecord& record)
-{
-    if (HasExtension(path, ".htr"))
-        return motion.Save(path, options.frameScale) || record.Fail(motion.Record().Failure());
-    if (HasExtension(path, ".glb"))
-        return SaveGlb(motion, MetersPerUnit(motion), path, record, UpAxisOf(motion));
-    TKBVHStream stream(motion);
-    return stream.WriteFile(path) || record.Fail(stream.Record().Failure());
-}
-
 } // namespace
 
 EExit RunTranscode(const ShellOptions& options)
@@ -115,7 +74,7 @@ EExit RunTranscode(const ShellOptions& options)
         return EExit::Failed;
     }
     CFailureRecord record;
-    if (!Write(options, motion, file.Path(), record))
+    if (!WriteTranscoded(motion, file.Path(), options.frameScale, record))
         return Fail(output, record.Failure());
     return file.DeliverOrSay() ? TellWritten(options, source, output) : EExit::Failed;
 }

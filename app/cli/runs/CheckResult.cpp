@@ -1,24 +1,15 @@
 #include "CheckResult.h"
 
-#include "CKeyframeControl.h"
 #include "CShellConversion.h"
 #include "ConvertFile.h"
 #include "HTRPose.h"
+#include "MeasureResult.h"
 #include "Paths.h"
 #include "ShellOptions.h"
-#include "SourceTiming.h"
 
 #include <filesystem>
 
 namespace gw {
-
-MotionClip SourceClipOf(const CFileConversion& conversion)
-{
-    const CKeyframeControl* track = ConversionTrack(conversion.SourceRoot());
-    if (!track)
-        return {};
-    return {conversion.DrivingRoot(), track->m_fFrequency, static_cast<int>(track->m_kKeyTimes.size())};
-}
 
 ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job)
 {
@@ -49,9 +40,7 @@ std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, c
     std::vector<MissingBone> missing;
     if (!ReadBonePairs(profilePath, motion.sourceClip.root, motion.resultClip.root, pairs, missing))
         return std::nullopt;
-    MeasuredConversion measured;
-    measured.sums = MeasureConversion(motion.sourceClip, motion.resultClip, pairs, &measured.detail);
-    return measured.sums.frameCount > 0 ? std::optional(std::move(measured)) : std::nullopt;
+    return MeasureResult(motion.sourceClip, motion.resultClip, pairs);
 }
 
 ConversionChoices ChoicesOf(const ShellOptions& options)

@@ -12,10 +12,6 @@ struct ConversionChoices;
 struct ConversionJob;
 struct ShellOptions;
 
-/// Returns the source of a finished conversion as it was read; it moves by the track that was used to convert
-/// it.
-MotionClip SourceClipOf(const CFileConversion& conversion);
-
 /// Returns the source and result of a finished conversion as clips, named after the job. Their trees belong
 /// to the conversion. The result must already be saved: its tracks are changed to what its file contains.
 ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob& job);

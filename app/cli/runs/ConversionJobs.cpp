@@ -2,6 +2,7 @@
 
 #include "CMotionFile.h"
 #include "Paths.h"
+#include "ResultExtension.h"
 #include "RunSetup.h"
 #include "SourceList.h"
 #include "Streams.h"

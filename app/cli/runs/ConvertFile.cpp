@@ -15,6 +15,7 @@
 #include "ConversionAccount.h"
 #include "Output.h"
 #include "Paths.h"
+#include "ResultExtension.h"
 #include "ResultSize.h"
 #include "Streams.h"
 #include "Words.h"

@@ -4,18 +4,9 @@
 #include "ChooseProfile.h"
 #include "DoubtWords.h"
 #include "FitWords.h"
-#include "Notice.h"
 #include "ProfileFit.h"
 
 namespace gw {
-
-Notice NoneFitsNotice(const std::string& source, const CProfileFit& nearest)
-{
-    Notice notice = MisfitNotice(source, nearest);
-    notice.words = nearest.rowCount == 0 ? "no profile is installed; name one with --profile FILE"
-                                         : "no installed profile fits; the closest is " + notice.words;
-    return notice;
-}
 
 void WriteFit(CJsonWriter& json, const CProfileFit& fit)
 {

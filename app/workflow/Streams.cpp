@@ -1,7 +1,6 @@
 #include "Streams.h"
 
 #include "Paths.h"
-#include "ShellOptions.h"
 
 #include <algorithm>
 
@@ -15,9 +14,6 @@ namespace {
 // replaced by another one.
 constexpr std::string_view kDescriptors[] = {"/dev/fd/", "/proc/self/fd/", "/dev/stdin", "/dev/stdout",
                                              "/dev/stderr"};
-
-// Formats of results other than .Kinetra.
-constexpr std::string_view kExchanged[] = {".htr", ".bvh", ".glb"};
 
 constexpr std::string_view kContainerMark = "TKOrrin Version";
 constexpr std::string_view kPackageMark = "MotionInfo"; // the name of a block at the start
@@ -58,26 +54,6 @@ bool IsStandardOutput(const std::string& path)
 {
     return path == kStandardStream || path == "/dev/stdout" || path == "/dev/fd/1" ||
            path == "/proc/self/fd/1";
-}
-
-std::string_view ResultExtension(const ShellOptions& options)
-{
-    for (const std::string_view extension : kExchanged)
-    {
-        if (extension.substr(1) == options.format)
-            return extension;
-    }
-    return ".Kinetra";
-}
-
-std::string_view ResultExtension(const ShellOptions& options, const std::string& output)
-{
-    for (const std::string_view extension : kExchanged)
-    {
-        if (options.format.empty() && HasExtension(output, extension))
-            return extension;
-    }
-    return ResultExtension(options);
 }
 
 std::string InFolder(const std::string& output, const std::string& source, std::string_view extension)

@@ -12,7 +12,6 @@
 #include "Paths.h"
 #include "Streams.h"
 #include "SystemError.h"
-#include "Words.h"
 
 #include <algorithm>
 #include <cerrno>
@@ -172,14 +171,6 @@ bool CSourceFile::CopyBytes(const std::string& path, std::span<const std::byte> 
         return FailToCopy(path);
     m_kPath = m_kCopy.Path();
     return true;
-}
-
-bool OpenSource(CSourceFile& source, const std::string& path, EPackage package)
-{
-    const bool isOpen = source.Open(path, package);
-    if (!isOpen)
-        SayError(source.Failure().path, source.Failure().code.c_str(), source.Failure().words);
-    return isOpen;
 }
 
 } // namespace gw

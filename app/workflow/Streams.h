@@ -5,8 +5,6 @@
 
 namespace gw {
 
-struct ShellOptions;
-
 /// The name of standard input as a source, and of standard output as a result.
 inline constexpr std::string_view kStandardStream = "-";
 
@@ -15,10 +13,6 @@ inline constexpr std::string_view kStandardStream = "-";
 bool IsStream(const std::string& path);
 /// Returns whether what is written to a path goes to standard output, where messages must not get between.
 bool IsStandardOutput(const std::string& path);
-/// Returns the extension of a result by the option --format; ".Kinetra" without it.
-std::string_view ResultExtension(const ShellOptions& options);
-/// Same for an output that may be a pipe: without --format, its name decides.
-std::string_view ResultExtension(const ShellOptions& options, const std::string& output);
 /// Returns the stem of a source's file name, for the names of files made from it. Standard input has one
 /// too.
 std::string StemOf(const std::string& source);

@@ -1,11 +1,8 @@
 #include "DraftedProfile.h"
 
-#include "CContentHash.h"
 #include "CNode.h"
-#include "CStances.h"
 #include "ProfileFile.h"
 #include "SourceTiming.h"
-#include "SuggestProfile.h"
 #include "Text.h"
 #include "Vec3.h"
 
@@ -15,6 +12,10 @@ namespace {
 
 constexpr const char* kJointWords[] = {"hip",     "spine joint", "neck",  "head", "clavicle", "upper arm",
                                        "forearm", "hand",        "thigh", "shin", "foot",     "toe"};
+
+constexpr const char* kRowSurenessNames[] = {"sure", "likely", "unsure"};
+constexpr const char* kEvidenceCodes[] = {"none", "shape", "shape-against-name", "name", "name-and-shape"};
+constexpr const char* kKindCodes[] = {"turned", "neutral", "fixed", "no-source", "no-name"};
 
 void Append(std::string& list, const std::string& word)
 {
@@ -29,6 +30,21 @@ std::string PlaceWords(BodyPlace place)
     if (!HasSides(place.joint))
         return joint;
     return std::string(place.side == EBodySide::Left ? "left " : "right ") + joint;
+}
+
+const char* RowKindCode(ESuggestedRow kind)
+{
+    return kKindCodes[static_cast<size_t>(kind)];
+}
+
+const char* RowSurenessName(ERowSureness sureness)
+{
+    return kRowSurenessNames[static_cast<size_t>(sureness)];
+}
+
+const char* EvidenceCode(EBodyEvidence evidence)
+{
+    return kEvidenceCodes[static_cast<size_t>(evidence)];
 }
 
 std::string DraftText(const SuggestedProfile& draft, const std::string& stem, CNode* sourceRoot)
@@ -63,24 +79,6 @@ std::optional<Notice> RateWarning(const std::string& path, CNode* sourceRoot)
                               std::to_string(profileRate) + ", so results will play " +
                               (sourceRate < profileRate ? "faster" : "slower");
     return MakeNotice(path, "rate", words, ESeverity::Warning);
-}
-
-// Relative to the root, whose own place often differs from take to take.
-std::string SkeletonDigits(CNode& root)
-{
-    const CStances stances(root);
-    std::string places = std::to_string(ProfileRateOf(&root));
-    for (int joint = 0; joint < static_cast<int>(stances.Joints().size()); ++joint)
-    {
-        const CNode* const node = stances.Joints()[static_cast<size_t>(joint)];
-        const Vec3 place = stances.Place(0, joint) - stances.Place(0, 0);
-        places += '\n';
-        places += node->NameView();
-        places += ' ' + std::to_string(stances.IndexOf(dynamic_cast<const CNode*>(node->GetParent())));
-        for (const float coordinate : {place.x, place.y, place.z})
-            places += ' ' + std::to_string(coordinate);
-    }
-    return CContentHash().AddText(places).Digits();
 }
 
 } // namespace gw

@@ -49,7 +49,4 @@ private:
     Notice m_kFailure;
 };
 
-/// Opens a source like CSourceFile::Open, but prints the reason of a failure.
-bool OpenSource(CSourceFile& source, const std::string& path, EPackage package);
-
 } // namespace gw

@@ -2,6 +2,7 @@
 
 #include "BodyJoints.h"
 #include "Notice.h"
+#include "SuggestProfile.h"
 
 #include <optional>
 #include <string>
@@ -9,10 +10,16 @@
 namespace gw {
 
 class CNode;
-struct SuggestedProfile;
 
 /// Returns the name of a joint's role: "left upper arm".
 std::string PlaceWords(BodyPlace place);
+
+/// Returns "turned", "neutral", "fixed", "no-source" or "no-name".
+const char* RowKindCode(ESuggestedRow kind);
+/// Returns "sure", "likely" or "unsure".
+const char* RowSurenessName(ERowSureness sureness);
+/// Returns "none", "shape", "shape-against-name", "name" or "name-and-shape".
+const char* EvidenceCode(EBodyEvidence evidence);
 
 /// Returns the text of a drafted profile, with the frame rate of its source. `stem` is the source's name.
 std::string DraftText(const SuggestedProfile& draft, const std::string& stem, CNode* sourceRoot);
@@ -21,9 +28,5 @@ std::string DraftText(const SuggestedProfile& draft, const std::string& stem, CN
 std::string WhyNotSure(const SuggestedProfile& draft);
 /// Returns a warning about a draft whose rate cannot be the source's, so that results play faster or slower.
 std::optional<Notice> RateWarning(const std::string& path, CNode* sourceRoot);
-
-/// Returns a hash of a skeleton: names, tree, and rest pose relative to its root, and the frame rate that a
-/// draft has. Sources of one skeleton can share a draft.
-std::string SkeletonDigits(CNode& root);
 
 } // namespace gw

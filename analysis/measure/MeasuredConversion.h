@@ -1,0 +1,15 @@
+#pragma once
+
+#include "ConversionDetail.h"
+#include "ConversionMeasures.h"
+
+namespace gw {
+
+/// All measures of a conversion.
+struct MeasuredConversion
+{
+    ConversionMeasures sums;
+    ConversionDetail detail;
+};
+
+} // namespace gw
