@@ -57,9 +57,10 @@ bool IsThere(const std::string& path)
     return lstat(path.c_str(), &status) == 0;
 }
 
+// Of this thread, because a thread opens the file that it has asked to keep.
 std::set<std::string>& KeptPaths()
 {
-    static std::set<std::string> paths;
+    thread_local std::set<std::string> paths;
     return paths;
 }
 
@@ -106,6 +107,11 @@ void CSafeFile::SetCommitGate(CommitGate gate)
 void CSafeFile::KeepExisting(const std::string& path)
 {
     KeptPaths().insert(path);
+}
+
+void CSafeFile::ReplaceExisting(const std::string& path)
+{
+    KeptPaths().erase(path);
 }
 
 CSafeFile::~CSafeFile()

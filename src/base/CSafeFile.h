@@ -53,6 +53,8 @@ public:
     /// Makes the next Open of this path, spelled the same, fail rather than replace anything: neither an
     /// existing file or link nor one that appears before Commit.
     static void KeepExisting(const std::string& path);
+    /// Takes that back, if the path has not been opened since.
+    static void ReplaceExisting(const std::string& path);
 
 private:
     bool MayReplace();

@@ -3,6 +3,7 @@
 #include "CFieldArchive.h"
 
 #include <algorithm>
+#include <atomic>
 
 namespace gw {
 
@@ -10,7 +11,7 @@ const CRTTI CParticles::ms_kRTTI{"CParticles", &CGeometry::ms_kRTTI};
 
 namespace {
 
-size_t s_uiSlots = 0; // of all living particle systems
+std::atomic<size_t> s_uiSlots = 0; // of all living particle systems
 
 } // namespace
 
@@ -66,7 +67,7 @@ void CParticles::MakeRoom(size_t count)
 {
     const size_t capacity = static_cast<size_t>(std::max(m_iParticleCount, 0));
     const size_t room = m_kParticles.size();
-    const size_t free = kMostSlots - std::min(s_uiSlots, kMostSlots);
+    const size_t free = kMostSlots - std::min(s_uiSlots.load(), kMostSlots);
     count = std::min({count, capacity, room + free});
     if (count <= room)
         return;

@@ -17,10 +17,10 @@ const CRTTI CSkinBoneControl::ms_kRTTI{"CSkinBoneControl", &CControl::ms_kRTTI};
 
 namespace {
 
-// Scratch space for points; shared by all skins of the process and kept between updates.
+// Scratch space for points; shared by all skins of a thread and kept between updates.
 std::vector<Vec3>& Scratch(size_t count)
 {
-    static std::vector<Vec3> scratch;
+    thread_local std::vector<Vec3> scratch;
     scratch.resize(std::max(scratch.size(), count));
     std::ranges::fill(scratch, kVec3Zero);
     return scratch;

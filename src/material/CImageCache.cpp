@@ -15,8 +15,15 @@ CImageCache& CImageCache::Instance()
     return cache;
 }
 
+void CImageCache::Enter(std::string_view path, CObject& image)
+{
+    const std::lock_guard lock(m_kMutex);
+    m_kImages.emplace(path, &image);
+}
+
 void CImageCache::Remove(std::string_view path, const CObject* image)
 {
+    const std::lock_guard lock(m_kMutex);
     const auto [first, last] = m_kImages.equal_range(path);
     for (auto entry = first; entry != last;)
         entry = entry->second == image ? m_kImages.erase(entry) : std::next(entry);
@@ -24,6 +31,7 @@ void CImageCache::Remove(std::string_view path, const CObject* image)
 
 void CImageCache::RemoveAll(std::string_view path)
 {
+    const std::lock_guard lock(m_kMutex);
     const auto [first, last] = m_kImages.equal_range(path);
     m_kImages.erase(first, last);
 }

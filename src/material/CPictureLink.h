@@ -71,6 +71,11 @@ void FollowLink(T& picture, COrrinStream& stream, CLinkRecord& record)
     if (!stream.HasBaseDirectory())
         return picture.SetLinkFileName(name.c_str());
     const std::string path = ResolveLinkName(stream.GetBaseDirectory(), name);
+    if (stream.LinkedPictures().m_uiByteLimit == 0)
+    {
+        picture.SetLinkFileName(path.c_str());
+        return picture.PictureLink().SetUnread(true);
+    }
     CImageCache& cache = CImageCache::Instance();
     if (T* known = cache.Find<T>(path))
     {

@@ -57,6 +57,7 @@ CTempFile* CTempStore::FileOf(uint32_t handle) const
 
 uint32_t CTempStore::Allocate(uint64_t byteCount)
 {
+    const std::lock_guard lock(m_kMutex);
     for (size_t i = 0; byteCount <= CTempPagedFile::kFileBytes && i < m_kFiles.size(); ++i)
     {
         if (!m_kFiles[i] || !m_kFiles[i]->TakesBlocks())
@@ -116,6 +117,7 @@ void CTempStore::RemoveFile(size_t index)
 
 void CTempStore::Free(uint32_t handle)
 {
+    const std::lock_guard lock(m_kMutex);
     CTempFile* file = FileOf(handle);
     if (file && file->Free(BlockOf(handle)))
         RemoveFile((handle >> 16) - 1);
@@ -123,12 +125,14 @@ void CTempStore::Free(uint32_t handle)
 
 std::byte* CTempStore::Map(uint32_t handle)
 {
+    const std::lock_guard lock(m_kMutex);
     CTempFile* file = FileOf(handle);
     return file ? file->Map(BlockOf(handle)) : nullptr;
 }
 
 void CTempStore::Unmap(uint32_t handle)
 {
+    const std::lock_guard lock(m_kMutex);
     if (CTempFile* file = FileOf(handle))
         file->Unmap(BlockOf(handle));
 }

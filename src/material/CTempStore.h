@@ -4,6 +4,7 @@
 
 #include <cstdint>
 #include <memory>
+#include <mutex>
 #include <string>
 #include <vector>
 
@@ -13,8 +14,8 @@ namespace gw {
 /// low half.
 inline constexpr uint32_t kLeastTempHandle = 65'537;
 
-/// Keeps large pixel blocks out of memory, in temporary files of which only the used parts are mapped. Not
-/// thread-safe, but mapped memory can be used by any thread.
+/// Keeps large pixel blocks out of memory, in temporary files of which only the used parts are mapped.
+/// Threads may use the store at the same time.
 class CTempStore
 {
 public:
@@ -56,6 +57,7 @@ private:
     std::string m_kFolder;
     uint64_t m_uiLimit = 0;
     uint64_t m_uiTotal = 0;
+    std::mutex m_kMutex; // of the files and their blocks
 };
 
 } // namespace gw

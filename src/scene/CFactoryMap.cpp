@@ -1,5 +1,7 @@
 #include "CFactoryMap.h"
 
+#include <mutex>
+
 namespace gw {
 
 CFactoryMap& CFactoryMap::Instance()
@@ -8,8 +10,15 @@ CFactoryMap& CFactoryMap::Instance()
     return map;
 }
 
+void CFactoryMap::Set(std::string_view className, CObjectFactory factory)
+{
+    const std::unique_lock lock(m_kMutex);
+    m_kFactory[std::string(className)] = factory;
+}
+
 CObjectFactory CFactoryMap::Find(std::string_view className) const
 {
+    const std::shared_lock lock(m_kMutex);
     const auto entry = m_kFactory.find(className);
     return entry == m_kFactory.end() ? nullptr : entry->second;
 }

@@ -3,6 +3,7 @@
 #include "CRTTI.h"
 
 #include <map>
+#include <shared_mutex>
 #include <span>
 #include <string>
 #include <string_view>
@@ -15,23 +16,23 @@ class COrrinStream;
 using CObjectFactory = CObject* (*)(COrrinStream& stream);
 
 /// Maps class names in containers to factories. One for the whole program, filled before main by the class
-/// tables of the rooms (SceneClasses.cpp and similar files).
+/// tables of the rooms (SceneClasses.cpp and similar files). Threads may set and find factories at the same
+/// time.
 class CFactoryMap
 {
 public:
     static CFactoryMap& Instance();
 
     /// Registers a factory; the last one for a name wins.
-    void Set(std::string_view className, CObjectFactory factory)
-    {
-        m_kFactory[std::string(className)] = factory;
-    }
+    void Set(std::string_view className, CObjectFactory factory);
     /// Returns the factory of a class, or null for an unregistered name.
     CObjectFactory Find(std::string_view className) const;
+    /// Returns all factories; do not set any meanwhile.
     const std::map<std::string, CObjectFactory, std::less<>>& Entries() const { return m_kFactory; }
 
 private:
     std::map<std::string, CObjectFactory, std::less<>> m_kFactory;
+    mutable std::shared_mutex m_kMutex;
 };
 
 /// One row of a room's class table.

@@ -54,7 +54,7 @@ COrnHTMLWriter ObjectPage()
 
 } // namespace
 
-CHTMLDump* CHTMLDump::ms_pkRunning = nullptr;
+thread_local CHTMLDump* CHTMLDump::ms_pkRunning = nullptr;
 
 // Breadth-first. Repeated nodes are listed but not expanded, so the tree is no larger than the graph's number
 // of links.

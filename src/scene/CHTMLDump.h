@@ -61,7 +61,7 @@ private:
     void SavePageOf(CObject& object);
     void SaveWaiting();
 
-    static CHTMLDump* ms_pkRunning; // collects linked objects; all pages are made on one thread
+    static thread_local CHTMLDump* ms_pkRunning; // collects linked objects
     std::string m_kFolder;
     std::unordered_set<const CObject*> m_kKnown;    // objects with a page
     std::unordered_set<const CObject*> m_kExpanded; // nodes whose children are listed in some tree

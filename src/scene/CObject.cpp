@@ -21,9 +21,9 @@
 
 namespace gw {
 
-uint8_t g_abObjectIDInUse[kObjectIDCount];
-uint32_t g_uiNextObjectID = 0;
-uint32_t g_uiObjectCount = 0;
+std::atomic<uint8_t> g_abObjectIDInUse[kObjectIDCount];
+std::atomic<uint32_t> g_uiNextObjectID = 0;
+std::atomic<uint32_t> g_uiObjectCount = 0;
 
 const CRTTI CObject::ms_kRTTI{"CObject", nullptr};
 
@@ -134,8 +134,8 @@ CObject::~CObject()
 {
     while (m_pkWatchers)
         m_pkWatchers->Watch(nullptr);
-    g_abObjectIDInUse[m_uiID] = 0;
-    --g_uiObjectCount;
+    g_abObjectIDInUse[m_uiID].store(0, std::memory_order_relaxed);
+    g_uiObjectCount.fetch_sub(1, std::memory_order_relaxed);
     m_spkCustomData = nullptr;
     m_spkModifier = nullptr;
     m_spkControl = nullptr;
@@ -145,11 +145,13 @@ CObject::~CObject()
 // meanwhile, it is reused immediately.
 void CObject::TakeID()
 {
-    while (g_abObjectIDInUse[g_uiNextObjectID])
-        g_uiNextObjectID = (g_uiNextObjectID + 1) & (kObjectIDCount - 1);
-    m_uiID = g_uiNextObjectID;
-    g_abObjectIDInUse[m_uiID] = 1;
-    ++g_uiObjectCount;
+    constexpr auto kOrder = std::memory_order_relaxed; // ids order nothing else
+    uint32_t id = g_uiNextObjectID.load(kOrder);
+    while (g_abObjectIDInUse[id].load(kOrder) || g_abObjectIDInUse[id].exchange(1, kOrder))
+        id = (id + 1) & (kObjectIDCount - 1);
+    g_uiNextObjectID.store(id, kOrder);
+    m_uiID = id;
+    g_uiObjectCount.fetch_add(1, kOrder);
 }
 
 void CObject::Release()

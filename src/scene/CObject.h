@@ -4,6 +4,7 @@
 #include "CText.h"
 #include "Ref.h"
 
+#include <atomic>
 #include <cstdint>
 #include <map>
 #include <string>
@@ -31,9 +32,11 @@ inline constexpr size_t kNestingLimit = 4000;
 /// The number of possible object ids.
 inline constexpr uint32_t kObjectIDCount = 8'388'608;
 
-extern uint8_t g_abObjectIDInUse[kObjectIDCount]; ///< one byte per id, nonzero while it is in use
-extern uint32_t g_uiNextObjectID;                 ///< where the search for a free id starts
-extern uint32_t g_uiObjectCount;                  ///< number of live objects
+// Threads may create and delete objects at the same time. One object, with all that it holds, belongs to one
+// thread at a time: its reference count is a plain number.
+extern std::atomic<uint8_t> g_abObjectIDInUse[kObjectIDCount]; ///< one byte per id, nonzero while in use
+extern std::atomic<uint32_t> g_uiNextObjectID;                 ///< where the search for a free id starts
+extern std::atomic<uint32_t> g_uiObjectCount;                  ///< number of live objects
 
 /// Base of all scene objects: class record, reference count, id, name and three chains of attached objects. A
 /// new object has count 0; it deletes itself when a release brings the count back to 0. Copying copies the

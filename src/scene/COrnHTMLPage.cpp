@@ -42,7 +42,7 @@ void COrnHTMLPage::WriteTo(std::FILE* file) const
 
 void COrnHTMLPage::AddFormat(const char* format, ...)
 {
-    static std::string buffer; // one for the program, as long as its longest line
+    thread_local std::string buffer; // as long as the longest line
     va_list arguments;
     va_start(arguments, format);
     va_list again;
