@@ -5,6 +5,7 @@
 #   ./build.sh demo         builds and converts an example motion
 #   ./build.sh test         builds and runs all tests
 #   ./build.sh asan         the same tests under AddressSanitizer and UndefinedBehaviorSanitizer
+#   ./build.sh thread-test  the tests of the library under ThreadSanitizer
 #   ./build.sh bench        runs the benchmarks: ratios within one run
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
 #   ./build.sh package      makes Debian packages in build/release/packages and tries them
@@ -145,6 +146,11 @@ asan)
   export LSAN_OPTIONS="suppressions=$PWD/tests/lsan.supp:print_suppressions=0"
   run_tests asan
   ;;
+thread-test)
+  prepare
+  build tsan
+  TSAN_OPTIONS="halt_on_error=1" build/tsan/bin/library_tests
+  ;;
 bench)
   need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
   build release
@@ -168,7 +174,7 @@ lint)
   lint "${2:-}"
   ;;
 *)
-  sed -n '4,13s/^# *//p' "$0"
+  sed -n '4,14s/^# *//p' "$0"
   exit 2
   ;;
 esac

@@ -34,8 +34,12 @@ function(gw_compile_options target)
             -Wconversion
             -Wnon-virtual-dtor
             -Woverloaded-virtual)
-  if(NOT GAITWRIGHT_SANITIZE AND NOT GAITWRIGHT_FUZZ)
+  if(NOT GAITWRIGHT_SANITIZE AND NOT GAITWRIGHT_FUZZ AND NOT GAITWRIGHT_THREADS)
     gw_harden(${target})
+  endif()
+  if(GAITWRIGHT_THREADS)
+    target_compile_options(${target} PRIVATE -O1 -fsanitize=thread -fno-omit-frame-pointer)
+    target_link_options(${target} PRIVATE -fsanitize=thread)
   endif()
   if(GAITWRIGHT_SANITIZE)
     target_compile_options(${target} PRIVATE -O1 -fsanitize=address,undefined -fno-sanitize-recover=all

@@ -44,6 +44,12 @@ bool IsRegular(const std::string& path)
     return stat(path.c_str(), &status) == 0 && S_ISREG(status.st_mode);
 }
 
+std::string& SetFolder()
+{
+    static std::string folder;
+    return folder;
+}
+
 } // namespace
 
 PathParts SplitPath(std::string_view path)
@@ -171,6 +177,8 @@ std::string TemporaryFolder()
 
 std::string ExecutableFolder()
 {
+    if (!SetFolder().empty())
+        return SetFolder();
     std::error_code error;
     fs::path program = fs::read_symlink("/proc/self/exe", error);
     if (error) // a root file system without /proc, such as a package build's
@@ -180,6 +188,11 @@ std::string ExecutableFolder()
         program = fs::canonical(path, error);
     }
     return SplitPath(TextOf(program)).folder;
+}
+
+void SetExecutableFolder(std::string folder)
+{
+    SetFolder() = WithSeparator(std::move(folder));
 }
 
 } // namespace gw

@@ -18,7 +18,7 @@
 // value.
 //
 // Versions. The library follows semantic versioning: a program that compiles with version 2.x compiles and
-// behaves the same with any later 2.y.
+// behaves the same with any later 2.y. A minor version can add members to structures, so compile again then.
 
 #include <array>
 #include <cstddef>
@@ -38,7 +38,9 @@
 #define GAITWRIGHT_VERSION_MINOR 0
 #define GAITWRIGHT_VERSION_PATCH 0
 
-namespace [[gnu::visibility("default")]] gaitwright {
+#pragma GCC visibility push(default) // the library is built with hidden symbols
+
+namespace gaitwright {
 
 struct Access; // how the library itself creates and reads handles
 
@@ -64,12 +66,12 @@ const char* SeverityName(Severity severity) noexcept;
 struct Failure
 {
     Severity severity = Severity::Error;
-    std::string reason; ///< fixed short code for programs: "blank-line", "not-found"
-    std::string path;   ///< the file concerned; may be empty
-    size_t line = 0;    ///< line of a text file
-    size_t byte = 0;    ///< same for a binary file
-    std::string name;   ///< bone, keyword, class or text concerned, as written in the file; may be empty
-    std::string words;  ///< sentence for people, with the remedy if there is one; safe to print
+    std::string reason = {}; ///< fixed short code for programs: "blank-line", "not-found"
+    std::string path = {};   ///< the file concerned; may be empty
+    size_t line = 0;         ///< line of a text file
+    size_t byte = 0;         ///< same for a binary file
+    std::string name = {};   ///< bone, keyword, class or text concerned, as written in the file; may be empty
+    std::string words = {};  ///< sentence for people, with the remedy if there is one; safe to print
 };
 
 /// Returns a failure as one line: "walk.bvh:12: an empty line where it is not allowed". Returns an empty text
@@ -141,9 +143,9 @@ private:
 /// What to read of a source, and how.
 struct LoadOptions
 {
-    std::string clip;  ///< the clip of a file with several, case ignored; empty for the longest
-    float rate = 0.0f; ///< frames per second in place of the file's; 0 for the file's own
-    bool mend = false; ///< read a damaged BVH file repaired, as far as that is safe
+    std::string clip = {}; ///< the clip of a file with several, case ignored; empty for the longest
+    float rate = 0.0f;     ///< frames per second in place of the file's; 0 for the file's own
+    bool mend = false;     ///< read a damaged BVH file repaired, as far as that is safe
 };
 
 /// What to do if a file exists where a result is written.
@@ -232,8 +234,8 @@ Outcome<Motion> LoadBytes(std::span<const std::byte> bytes, std::string_view for
 /// A row of a bone map: which source bone drives a target bone.
 struct MapRow
 {
-    std::string target;
-    std::string source;            ///< empty for a fixed row, whose bone keeps its rest pose
+    std::string target = {};
+    std::string source = {};       ///< empty for a fixed row, whose bone keeps its rest pose
     std::array<int, 3> rotation{}; ///< offset about X, Y and Z in degrees
     std::array<int, 3> axes{};     ///< codes of the source axes that drive X, Y and Z
 };
@@ -287,7 +289,7 @@ struct MapChoice
     size_t foundCount = 0;                  ///< rows whose bones exist
     bool adapted = false;                   ///< the common prefix of the motion's names was added to the rows
     Sureness sureness = Sureness::Doubtful; ///< meaningful if it fits
-    std::vector<std::string> doubts;        ///< what speaks against it, one sentence each
+    std::vector<std::string> doubts = {};   ///< what speaks against it, one sentence each
 };
 
 // In the functions below, `dataFolder` is the folder with the target skeleton base.htr and the installed bone
@@ -307,26 +309,26 @@ Outcome<MapChoice> ChooseMap(const Motion& motion, const std::string& dataFolder
 /// A row of a drafted map, with its evidence.
 struct SuggestedRow
 {
-    MapRow row;
-    std::string joint;    ///< what the source bone is in its body: "left upper arm"; empty for a fixed row
-    std::string kind;     ///< "turned", "neutral", "fixed"; "no-source" and "no-name" are not in the map
-    std::string sureness; ///< "sure", "likely" or "unsure"; empty for rows without a source
-    std::string evidence; ///< "name-and-shape", "name", "shape", "shape-against-name" or "none"
-    std::vector<std::string> doubts; ///< codes
+    MapRow row = {};
+    std::string joint = {}; ///< what the source bone is in its body: "left upper arm"; empty for a fixed row
+    std::string kind = {};  ///< "turned", "neutral", "fixed"; "no-source" and "no-name" are not in the map
+    std::string sureness = {}; ///< "sure", "likely" or "unsure"; empty for rows without a source
+    std::string evidence = {}; ///< "name-and-shape", "name", "shape", "shape-against-name" or "none"
+    std::vector<std::string> doubts = {}; ///< codes
     /// Angle in degrees between both bones' directions in the source's rest pose; missing if one of them has
     /// no direction.
-    std::optional<double> restError;
+    std::optional<double> restError = {};
 };
 
 /// A map that was drafted for a skeleton.
 struct Suggestion
 {
     BoneMap map;
-    std::vector<SuggestedRow> rows; ///< also those that are not in the map
-    bool sure = false;              ///< every main row is sure; Convert uses only such a draft
-    std::string whyNotSure;         ///< sentence; empty if sure
-    bool sidesAreSure = false;      ///< names or poses show which side is left
-    bool restIsStance = false;      ///< the rest pose is a standing pose
+    std::vector<SuggestedRow> rows = {}; ///< also those that are not in the map
+    bool sure = false;                   ///< every main row is sure; Convert uses only such a draft
+    std::string whyNotSure = {};         ///< sentence; empty if sure
+    bool sidesAreSure = false;           ///< names or poses show which side is left
+    bool restIsStance = false;           ///< the rest pose is a standing pose
 };
 
 /// Drafts a bone map for the skeleton of a motion, by the names of its joints and their shape. Fails with the
@@ -347,17 +349,17 @@ struct FrameRange
 /// How to convert. The defaults give what `gaitwright convert` gives without options.
 struct ConvertOptions
 {
-    std::optional<BoneMap> map; ///< the bone map to use
-    std::string mapName;        ///< same by name or path, as for LoadMap; used if `map` is missing
-    bool draft = false;         ///< if no installed map fits, draft one, and use it if its main rows are sure
-    bool align = false;         ///< re-express the source relative to a T-pose first
-    bool faithful = false;      ///< keep trunk, hips, knees and feet close to the source; pin planted feet
-    bool hands = true;          ///< with `faithful`, keep hands where they touch
-    bool legs = true;           ///< plant the feet where the source's feet are planted
-    FrameRange frames;          ///< keep only these frames
-    bool inPlace = false;       ///< cancel the horizontal travel; heights are kept
-    bool mirror = false;        ///< exchange left and right
-    std::string dataFolder;     ///< see above LoadMap
+    std::optional<BoneMap> map = {}; ///< the bone map to use
+    std::string mapName = {};        ///< same by name or path, as for LoadMap; used if `map` is missing
+    bool draft = false;     ///< if no installed map fits, draft one, and use it if its main rows are sure
+    bool align = false;     ///< re-express the source relative to a T-pose first
+    bool faithful = false;  ///< keep trunk, hips, knees and feet close to the source; pin planted feet
+    bool hands = true;      ///< with `faithful`, keep hands where they touch
+    bool legs = true;       ///< plant the feet where the source's feet are planted
+    FrameRange frames = {}; ///< keep only these frames
+    bool inPlace = false;   ///< cancel the horizontal travel; heights are kept
+    bool mirror = false;    ///< exchange left and right
+    std::string dataFolder = {}; ///< see above LoadMap
 };
 
 /// How far a planted joint slides more than in the source, in mm over the ground.
@@ -372,32 +374,32 @@ struct SlideFigures
 /// How well one mapped bone keeps its direction. Angles are in degrees.
 struct BoneFigures
 {
-    std::string target;        ///< bone of the result
-    std::string source;        ///< bone that drives it
-    std::string targetChild;   ///< joint at the end of the direction; empty for an end joint
-    std::string sourceChild;   ///< same in the source
-    bool measured = false;     ///< both sides have a direction; otherwise the figures below are 0
-    double meanError = 0.0;    ///< mean angle between the two directions over all frames
-    double largestError = 0.0; ///< largest of these angles
-    int largestFrame = 0;      ///< its frame
+    std::string target = {};      ///< bone of the result
+    std::string source = {};      ///< bone that drives it
+    std::string targetChild = {}; ///< joint at the end of the direction; empty for an end joint
+    std::string sourceChild = {}; ///< same in the source
+    bool measured = false;        ///< both sides have a direction; otherwise the figures below are 0
+    double meanError = 0.0;       ///< mean angle between the two directions over all frames
+    double largestError = 0.0;    ///< largest of these angles
+    int largestFrame = 0;         ///< its frame
 };
 
 /// How well the bones of a part of the body keep their directions. Angles are in degrees.
 struct PartFigures
 {
-    std::string part;          ///< "upper arm"
-    size_t boneCount = 0;      ///< measured bones; if 0, the figures below are 0
-    double meanError = 0.0;    ///< over these bones and all frames
-    double largestError = 0.0; ///< largest error of one bone in one frame
-    std::string largestBone;   ///< that bone
-    int largestFrame = 0;      ///< that frame
+    std::string part = {};        ///< "upper arm"
+    size_t boneCount = 0;         ///< measured bones; if 0, the figures below are 0
+    double meanError = 0.0;       ///< over these bones and all frames
+    double largestError = 0.0;    ///< largest error of one bone in one frame
+    std::string largestBone = {}; ///< that bone
+    int largestFrame = 0;         ///< that frame
 };
 
 /// What one foot does. Angles are in degrees, lengths in mm.
 struct FootFigures
 {
-    std::string target;             ///< ankle of the result
-    std::string source;             ///< ankle that drives it
+    std::string target = {};        ///< ankle of the result
+    std::string source = {};        ///< ankle that drives it
     double turnMean = 0.0;          ///< signed mean angle about Y between the headings
     double turnError = 0.0;         ///< mean of its absolute value
     double turnLargest = 0.0;       ///< largest absolute value
@@ -405,55 +407,55 @@ struct FootFigures
     bool turnFromStart = false;     ///< a side has no toe joint, so turns are relative to frame 0
     double soleTiltMean = 0.0;    ///< angle of the result's sole to the floor, while the source's foot stands
     double soleTiltLargest = 0.0; ///< largest such angle
-    double sourceSoleTiltMean = 0.0;       ///< mean of the source's sole
-    SlideFigures ankleSlide;               ///< added slide of the ankle
-    SlideFigures toeSlide;                 ///< added slide of the toe joint, if both sides have one
-    size_t sourceContacts = 0;             ///< contacts with the floor
-    size_t resultContacts = 0;             ///< same in the result
-    size_t sourceStanding = 0;             ///< frames in contact
-    size_t resultStanding = 0;             ///< same in the result
-    size_t bothStanding = 0;               ///< frames in which both are
-    std::optional<double> contactF1;       ///< 1 if the same frames are in contact; missing if none is
-    std::optional<double> heldSole;        ///< distance of a standing sole from the floor, 95th percentile
-    std::optional<double> heldSoleLargest; ///< largest such distance
-    int heldSoleFrame = 0;                 ///< its frame
-    size_t kneePops = 0;            ///< sudden changes of the knee's angle that the source does not have
-    double kneePopLargest = 0.0;    ///< largest excess over the source's change
-    std::vector<int> kneePopFrames; ///< worst frame of each pop
+    double sourceSoleTiltMean = 0.0;      ///< mean of the source's sole
+    SlideFigures ankleSlide = {};         ///< added slide of the ankle
+    SlideFigures toeSlide = {};           ///< added slide of the toe joint, if both sides have one
+    size_t sourceContacts = 0;            ///< contacts with the floor
+    size_t resultContacts = 0;            ///< same in the result
+    size_t sourceStanding = 0;            ///< frames in contact
+    size_t resultStanding = 0;            ///< same in the result
+    size_t bothStanding = 0;              ///< frames in which both are
+    std::optional<double> contactF1 = {}; ///< 1 if the same frames are in contact; missing if none is
+    std::optional<double> heldSole = {};  ///< distance of a standing sole from the floor, 95th percentile
+    std::optional<double> heldSoleLargest = {}; ///< largest such distance
+    int heldSoleFrame = 0;                      ///< its frame
+    size_t kneePops = 0;                 ///< sudden changes of the knee's angle that the source does not have
+    double kneePopLargest = 0.0;         ///< largest excess over the source's change
+    std::vector<int> kneePopFrames = {}; ///< worst frame of each pop
 };
 
 /// What one hand does. Lengths are in mm.
 struct HandFigures
 {
-    std::string target; ///< hand of the result
-    std::string source; ///< bone that drives it
+    std::string target = {}; ///< hand of the result
+    std::string source = {}; ///< bone that drives it
     size_t touchFrames =
         0; ///< frames in which the source's hand touches the body, the floor or the other hand
     std::optional<double>
-        gap;                 ///< how much farther from what it touches the result's hand is, 95th percentile
-    std::string gapPart;     ///< "thigh", "torso", "head", "other hand" or "floor"
-    double gapLargest = 0.0; ///< largest gap in one frame
-    int gapFrame = 0;        ///< its frame
-    double depth = 0.0;      ///< largest depth below the floor
-    int depthFrame = 0;      ///< its frame
+        gap;                  ///< how much farther from what it touches the result's hand is, 95th percentile
+    std::string gapPart = {}; ///< "thigh", "torso", "head", "other hand" or "floor"
+    double gapLargest = 0.0;  ///< largest gap in one frame
+    int gapFrame = 0;         ///< its frame
+    double depth = 0.0;       ///< largest depth below the floor
+    int depthFrame = 0;       ///< its frame
 };
 
 /// A frame that somebody should look at.
 struct WorstFrame
 {
-    int frame = 0;       ///< of the source
-    std::string fault;   ///< code: "direction", "trunk", "kneePop", "ankleSlide", "handGap", ...
-    double amount = 0.0; ///< degrees or mm
-    std::string target;  ///< bone of the result
-    std::string source;  ///< bone that drives it
-    std::string part;    ///< for a hand: what it touches; otherwise empty
+    int frame = 0;           ///< of the source
+    std::string fault = {};  ///< code: "direction", "trunk", "kneePop", "ankleSlide", "handGap", ...
+    double amount = 0.0;     ///< degrees or mm
+    std::string target = {}; ///< bone of the result
+    std::string source = {}; ///< bone that drives it
+    std::string part = {};   ///< for a hand: what it touches; otherwise empty
 };
 
 /// A figure that summarizes the quality of a conversion.
 struct KeyFigure
 {
-    std::string key;             ///< identifier
-    std::optional<double> value; ///< missing if the motion does not have what is measured
+    std::string key = {};             ///< identifier
+    std::optional<double> value = {}; ///< missing if the motion does not have what is measured
 };
 
 /// How faithful a conversion is: the figures of `gaitwright convert --check`. Frames are those of the source,
@@ -461,34 +463,34 @@ struct KeyFigure
 /// are scaled by the ratio of the leg lengths.
 struct Figures
 {
-    int frameCount = 0;                       ///< compared frames
-    double frameScale = 1.0;                  ///< result frames per source frame
-    double sourceLeg = 0.0;                   ///< leg length in the source's unit; 0 without a mapped leg
-    double resultLeg = 0.0;                   ///< leg length of the result
-    double meanError = 0.0;                   ///< mean angle between the directions of mapped bones
-    double largestError = 0.0;                ///< largest one
-    std::optional<double> trunkMean;          ///< mean angle between the lines from hips to neck
-    std::optional<double> trunkMost;          ///< 95th percentile of that angle
-    double trunkLargest = 0.0;                ///< largest one
-    int trunkFrame = 0;                       ///< its frame
-    std::optional<double> jitterRatio;        ///< leg jitter, result / source, median over the bones
-    std::optional<double> jitterRatioLargest; ///< largest ratio of a bone
-    SlideFigures ankleSlide;                  ///< over the plants of both feet
-    SlideFigures toeSlide;                    ///< same for the toe joints
-    std::optional<double> contactF1;          ///< 1 if the feet stand in the same frames
-    std::optional<double> heldSole;           ///< distance of standing soles from the floor, 95th percentile
+    int frameCount = 0;                     ///< compared frames
+    double frameScale = 1.0;                ///< result frames per source frame
+    double sourceLeg = 0.0;                 ///< leg length in the source's unit; 0 without a mapped leg
+    double resultLeg = 0.0;                 ///< leg length of the result
+    double meanError = 0.0;                 ///< mean angle between the directions of mapped bones
+    double largestError = 0.0;              ///< largest one
+    std::optional<double> trunkMean = {};   ///< mean angle between the lines from hips to neck
+    std::optional<double> trunkMost = {};   ///< 95th percentile of that angle
+    double trunkLargest = 0.0;              ///< largest one
+    int trunkFrame = 0;                     ///< its frame
+    std::optional<double> jitterRatio = {}; ///< leg jitter, result / source, median over the bones
+    std::optional<double> jitterRatioLargest = {}; ///< largest ratio of a bone
+    SlideFigures ankleSlide = {};                  ///< over the plants of both feet
+    SlideFigures toeSlide = {};                    ///< same for the toe joints
+    std::optional<double> contactF1 = {};          ///< 1 if the feet stand in the same frames
+    std::optional<double> heldSole = {};      ///< distance of standing soles from the floor, 95th percentile
     double sinkDepth = 0.0;                   ///< depth of the lowest sole below the floor, 95th percentile
-    std::optional<double> handGap;            ///< larger of the two hands' gaps
-    std::optional<double> handDepth;          ///< larger of the two depths
+    std::optional<double> handGap = {};       ///< larger of the two hands' gaps
+    std::optional<double> handDepth = {};     ///< larger of the two depths
     double sourceTravel = 0.0;                ///< path of the hips over the ground, in leg lengths
     double resultTravel = 0.0;                ///< same for the result
-    std::optional<double> travelRatio;        ///< result / source; missing if the source hardly moves
-    std::vector<BoneFigures> bones;           ///< in the order of the map's rows
-    std::vector<PartFigures> parts;           ///< main parts of the body
-    std::vector<FootFigures> feet;            ///< left, right; only mapped ones
-    std::vector<HandFigures> hands;           ///< left, right; only mapped ones
-    std::vector<WorstFrame> worstFrames;      ///< worst first
-    std::vector<KeyFigure> keyFigures;        ///< always the same ones in the same order
+    std::optional<double> travelRatio = {};   ///< result / source; missing if the source hardly moves
+    std::vector<BoneFigures> bones = {};      ///< in the order of the map's rows
+    std::vector<PartFigures> parts = {};      ///< main parts of the body
+    std::vector<FootFigures> feet = {};       ///< left, right; only mapped ones
+    std::vector<HandFigures> hands = {};      ///< left, right; only mapped ones
+    std::vector<WorstFrame> worstFrames = {}; ///< worst first
+    std::vector<KeyFigure> keyFigures = {};   ///< always the same ones in the same order
 };
 
 /// A finished conversion. A handle: see Threads above.
@@ -540,13 +542,13 @@ Outcome<Conversion> Convert(const Motion& motion, const ConvertOptions& options 
 struct Finding
 {
     Severity severity = Severity::Error;
-    std::string reason;   ///< fixed short code
-    size_t line = 0;      ///< line, or byte of a binary file
-    std::string name;     ///< joint, keyword or text concerned; may be empty
-    std::string words;    ///< what is wrong
-    std::string remedy;   ///< what to do about it; may be empty
-    size_t more = 0;      ///< further places with the same fault
-    bool fixable = false; ///< Mend repairs it
+    std::string reason = {}; ///< fixed short code
+    size_t line = 0;         ///< line, or byte of a binary file
+    std::string name = {};   ///< joint, keyword or text concerned; may be empty
+    std::string words = {};  ///< what is wrong
+    std::string remedy = {}; ///< what to do about it; may be empty
+    size_t more = 0;         ///< further places with the same fault
+    bool fixable = false;    ///< Mend repairs it
 };
 
 /// Facts about a valid motion.
@@ -556,18 +558,18 @@ struct MotionFacts
     size_t frameCount = 0;
     double frameSeconds = 0.0; ///< time between frames
     double leg = 0.0;          ///< length of thigh and shin in the file's unit; 0 if unknown
-    std::string unit;          ///< unit of the file, or the one that the leg suggests; empty if unknown
-    std::string up;            ///< "Y", "-Z", ...; empty if unknown
-    std::string restPose;      ///< "T-pose", "A-pose", "arms down", "other", "none" or "unknown"
-    std::string body;          ///< how the body was found: "names", "shape" or "none"
+    std::string unit = {};     ///< unit of the file, or the one that the leg suggests; empty if unknown
+    std::string up = {};       ///< "Y", "-Z", ...; empty if unknown
+    std::string restPose = {}; ///< "T-pose", "A-pose", "arms down", "other", "none" or "unknown"
+    std::string body = {};     ///< how the body was found: "names", "shape" or "none"
 };
 
 /// The examination of a file.
 struct Examination
 {
-    bool healthy = false;             ///< no errors and no warnings
-    std::vector<Finding> findings;    ///< by line; those about the whole file first
-    std::optional<MotionFacts> facts; ///< missing if no motion could be read
+    bool healthy = false;                  ///< no errors and no warnings
+    std::vector<Finding> findings = {};    ///< by line; those about the whole file first
+    std::optional<MotionFacts> facts = {}; ///< missing if no motion could be read
 };
 
 /// Examines a motion file as `gaitwright doctor` does. Fails only if the file cannot be examined at all; a
@@ -578,4 +580,6 @@ Outcome<Examination> Doctor(const std::string& path) noexcept;
 Outcome<Examination> Mend(const std::string& path, const std::string& output,
                           Existing existing = Existing::Keep) noexcept;
 
-} // namespace gnu::visibility("default")]]gaitwright
+} // namespace gaitwright
+
+#pragma GCC visibility pop

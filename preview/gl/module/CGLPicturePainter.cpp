@@ -148,7 +148,7 @@ std::vector<std::byte> CGLPicturePainter::EncodePng(const RgbPicture& picture)
 
 } // namespace gw
 
-extern "C" gw::CPicturePainter* gw_picture_painter()
+extern "C" [[gnu::visibility("default")]] gw::CPicturePainter* gw_picture_painter()
 {
     static gw::CGLPicturePainter painter;
     return &painter;

@@ -179,7 +179,7 @@ public:
 
 } // namespace gw
 
-extern "C" gw::CPictureCodec* gw_picture_codec()
+extern "C" [[gnu::visibility("default")]] gw::CPictureCodec* gw_picture_codec()
 {
     static gw::CMagickCodec codec;
     return &codec;
