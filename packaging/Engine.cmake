@@ -1,18 +1,13 @@
-# The engine for other programs: find_package(Gaitwright), with one imported target per room; Gaitwright::app
-# includes nearly all of them. See examples/convert.
+# The library for other programs: find_package(Gaitwright) with the target Gaitwright::gaitwright, or pkg-config. See
+# examples/convert.
 include(CMakePackageConfigHelpers)
 
 set(configs ${CMAKE_INSTALL_LIBDIR}/cmake/Gaitwright)
-gw_rooms_seen(rooms gw_app gw_page gw_drivers)
-foreach(room IN LISTS rooms)
-  string(REGEX REPLACE "^gw_" "" name ${room})
-  set_target_properties(${room} PROPERTIES EXPORT_NAME ${name})
-  install(
-    TARGETS ${room}
-    EXPORT Gaitwright
-    ARCHIVE DESTINATION ${GAITWRIGHT_PROGRAMS} COMPONENT develop
-    FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR}/gaitwright/${name} COMPONENT develop)
-endforeach()
+install(
+  TARGETS libgaitwright
+  EXPORT Gaitwright
+  LIBRARY DESTINATION ${CMAKE_INSTALL_LIBDIR} COMPONENT library NAMELINK_COMPONENT develop
+  FILE_SET HEADERS DESTINATION ${CMAKE_INSTALL_INCLUDEDIR} COMPONENT develop)
 install(EXPORT Gaitwright NAMESPACE Gaitwright:: FILE GaitwrightTargets.cmake DESTINATION ${configs}
         COMPONENT develop)
 
@@ -23,3 +18,16 @@ write_basic_package_version_file(${CMAKE_CURRENT_BINARY_DIR}/GaitwrightConfigVer
 install(FILES ${CMAKE_CURRENT_BINARY_DIR}/GaitwrightConfig.cmake
               ${CMAKE_CURRENT_BINARY_DIR}/GaitwrightConfigVersion.cmake
         DESTINATION ${configs} COMPONENT develop)
+
+# For pkg-config, relative to the file itself, so an installation can be moved. Another one is for the build.
+file(RELATIVE_PATH pc_prefix ${CMAKE_INSTALL_FULL_LIBDIR}/pkgconfig ${CMAKE_INSTALL_PREFIX})
+set(pc_prefix "\${pcfiledir}/${pc_prefix}")
+set(pc_include "\${prefix}/${CMAKE_INSTALL_INCLUDEDIR}")
+set(pc_library "\${prefix}/${CMAKE_INSTALL_LIBDIR}")
+configure_file(gaitwright.pc.in gaitwright.pc @ONLY)
+install(FILES ${CMAKE_CURRENT_BINARY_DIR}/gaitwright.pc DESTINATION ${CMAKE_INSTALL_LIBDIR}/pkgconfig
+        COMPONENT develop)
+set(pc_prefix ${CMAKE_BINARY_DIR})
+set(pc_include ${PROJECT_SOURCE_DIR}/library/include)
+set(pc_library ${CMAKE_RUNTIME_OUTPUT_DIRECTORY})
+configure_file(gaitwright.pc.in ${CMAKE_BINARY_DIR}/pkgconfig/gaitwright.pc @ONLY)

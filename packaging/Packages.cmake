@@ -52,13 +52,29 @@ Opens a BVH, HTR, CHA or CHB motion and, with gaitwright-import, an FBX, glTF
 or Collada file, converts it by a bone map, plays source and result side by
 side, and saves a Kinetra file. An editor makes and changes bone maps.")
 
+# The data of a conversion are in the shell's package.
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_SECTION libs)
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_DEPENDS "gaitwright (= ${PROJECT_VERSION})")
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_RECOMMENDS gaitwright-import)
+# Debian runs ldconfig by a trigger. CPack would add scripts that run it too, unless the package names its own scripts;
+# the two that are named here do not exist, and CPack only warns about them.
+set(control ${CMAKE_CURRENT_BINARY_DIR}/control)
+file(WRITE ${control}/triggers "activate-noawait ldconfig\n")
+file(WRITE ${control}/shlibs
+     "libgaitwright ${PROJECT_VERSION_MAJOR}.${PROJECT_VERSION_MINOR} ${GAITWRIGHT_LIBRARY} (>= ${PROJECT_VERSION})\n")
+set(CPACK_DEBIAN_LIBRARY_PACKAGE_CONTROL_EXTRA
+    "${control}/triggers;${control}/shlibs;${control}/postinst;${control}/postrm")
+set(CPACK_COMPONENT_LIBRARY_DESCRIPTION
+    "motion capture converted to one fixed skeleton, shared library
+Reads motions, moves them onto the target skeleton with a bone map, measures
+the results and writes them, for programs that do this themselves.")
+
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_SECTION libdevel)
 set(CPACK_DEBIAN_DEVELOP_PACKAGE_SHLIBDEPS OFF) # the package has no shared libraries
-set(CPACK_DEBIAN_DEVELOP_PACKAGE_DEPENDS "gaitwright (= ${PROJECT_VERSION})")
+set(CPACK_DEBIAN_DEVELOP_PACKAGE_DEPENDS "${GAITWRIGHT_LIBRARY} (= ${PROJECT_VERSION})")
 set(CPACK_COMPONENT_DEVELOP_DESCRIPTION
-    "engine of Gaitwright for other programs, development files
-Static libraries, headers and a CMake package for programs that read, convert
-and write motions themselves: the readers and writers, the scene library, the
-retargeter and the conversion's state machine. No toolkit is needed.")
+    "motion capture converted to one fixed skeleton, development files
+The header of the Gaitwright library, with which programs read, convert,
+measure and write motions, a CMake package and a file for pkg-config.")
 
 include(CPack)

@@ -1,14 +1,15 @@
-// convert SOURCE.bvh PROFILE.prf OUTPUT.Kinetra
-#include <ConvertMotionFile.h>
-#include <Notice.h>
+// convert SOURCE PROFILE OUTPUT
 #include <cstdio>
+#include <gaitwright/gaitwright.h>
 
 int main(int argc, char** argv)
 {
     if (argc != 4)
         return 2;
-    const gw::MotionFileResult result = gw::ConvertMotionFile({argv[1], argv[2], argv[3], DATA_FOLDER, {}});
-    for (const gw::Notice& notice : result.notices)
-        std::fprintf(stderr, "%s\n", gw::NoticeLine(notice).c_str());
-    return result.written ? 0 : 1;
+    const auto motion = gaitwright::Load(argv[1]);
+    const auto result = motion ? gaitwright::Convert(*motion, {.mapName = argv[2]}) : motion.Error();
+    const auto saved = result ? result->Save(argv[3]) : result.Error();
+    if (!saved)
+        std::fprintf(stderr, "%s\n", gaitwright::Line(saved.Error()).c_str());
+    return saved ? 0 : 1;
 }

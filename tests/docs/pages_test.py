@@ -20,6 +20,10 @@ from picture import Picture, differing
 PAGES = [harness.ROOT / "README.md", harness.ROOT / "docs" / "bone-maps.md", harness.ROOT / "docs" / "pipelines.md",
          *sorted((harness.ROOT / "docs" / "formats").glob("*.md"))]
 
+# The page about the library needs a compiler, and a library that plain programs can load.
+LIBRARY = {name: os.environ[name] for name in ("PKG_CONFIG_PATH", "LD_LIBRARY_PATH") if name in os.environ}
+PAGES += [harness.ROOT / "docs" / "library.md"] if "PKG_CONFIG_PATH" in LIBRARY else []
+
 MOST_OTHER_BYTES = 0.005  # of a picture; the bones and axes of a figure are a fiftieth
 
 FORMS = {"u8": "<B", "u16": "<H", "u32": "<I", "i32": "<i", "f32": "<f", "vec3": "<3f", "quat": "<4f", "mat4": "<16f"}
@@ -59,6 +63,7 @@ class PageTest(harness.CliTest):
         for name in ("examples", "assets"):
             (self.folder / name).symlink_to(harness.ROOT / name)
         os.symlink(harness.PROGRAM, self.folder / "bin" / "gaitwright")
+        self.environment.update(LIBRARY)
         self.environment["PATH"] = "%s:%s" % (self.folder / "bin", self.environment["PATH"])
 
     def take_block(self, block):

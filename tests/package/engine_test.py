@@ -1,4 +1,4 @@
-"""The engine as another program has it: found by CMake in an installation, linked, and doing what the shell does."""
+"""The library in another program: found in an installation, by CMake and by pkg-config, and equal to the shell."""
 import os
 import shutil
 import subprocess
@@ -31,6 +31,12 @@ class Engine(unittest.TestCase):
         cls.run_here(CMAKE, "-S", ROOT / "examples/convert", "-B", "build", "-G", "Ninja",
                      "-DCMAKE_PREFIX_PATH={}".format(cls.prefix), "-DCMAKE_CXX_COMPILER=" + os.environ["CXX"])
         cls.run_here(CMAKE, "--build", "build")
+        found = next(cls.prefix.glob("lib/**/pkgconfig"))
+        os.environ["PKG_CONFIG_PATH"] = str(found)
+        flags = cls.run_here("pkg-config", "--cflags", "--libs", "gaitwright >= 2.0").split()
+        (cls.folder / "plain").mkdir()
+        cls.run_here(os.environ["CXX"], "-std=c++20", "-Wall", "-Wextra", "-Werror", ROOT / "examples/convert/main.cpp",
+                     "-o", "plain/convert", *flags, "-Wl,-rpath,{}".format(found.parent))
         shutil.copy(WALK, cls.folder)
         text = WALK.read_text()
         (cls.folder / "still.bvh").write_text(text[:text.index("Frames:")] + "Frames: 0\nFrame Time: 0.033333\n")
@@ -42,13 +48,13 @@ class Engine(unittest.TestCase):
             raise AssertionError("{}: {}".format(" ".join(map(str, arguments)), done.stdout + done.stderr))
         return done.stdout
 
-    def convert(self, source, profile, output):
-        return subprocess.run(["build/convert", source, self.prefix / "share/gaitwright" / profile, output],
+    def convert(self, source, profile, output, folder="build"):
+        return subprocess.run([folder + "/convert", source, self.prefix / "share/gaitwright" / profile, output],
                               cwd=self.folder, capture_output=True, text=True, timeout=SECONDS)
 
     def test_the_example_writes_what_the_shell_writes(self):
-        for name in ("walk.Kinetra", "walk.htr"):
-            done = self.convert("walk.bvh", "PoserBVH.prf", "example-" + name)
+        for folder, name in (("build", "walk.Kinetra"), ("plain", "walk.htr")):
+            done = self.convert("walk.bvh", "PoserBVH.prf", "example-" + name, folder)
             self.assertEqual((done.returncode, done.stderr), (0, ""))
             self.run_here(PROGRAM, "convert", "walk.bvh", "-o", "shell-" + name, "--profile", "Poser BVH")
             self.assertEqual((self.folder / ("example-" + name)).read_bytes(),
@@ -62,6 +68,13 @@ class Engine(unittest.TestCase):
                 self.assertEqual(done.returncode, 1)
                 self.assertIn(words, done.stderr)
                 self.assertEqual(sorted(self.folder.iterdir()), before)
+
+    def test_nothing_but_the_header_is_installed_or_exported(self):
+        self.assertEqual([path.name for path in (self.prefix / "include").rglob("*") if path.is_file()], ["gaitwright.h"])
+        library = next(self.prefix.glob("lib/**/libgaitwright.so"))
+        symbols = self.run_here("nm", "-DC", "--defined-only", library).splitlines()
+        self.assertTrue(symbols)
+        self.assertEqual([symbol for symbol in symbols if " gaitwright::" not in symbol], [])
 
     def test_the_installed_program_finds_its_data_where_it_was_moved_to(self):
         told = self.run_here(self.prefix / "bin/gaitwright", "profiles")

@@ -19,7 +19,8 @@ SECONDS = 60
 SEARCH = {"PATH": os.environ.get("PATH", "") + ":/usr/sbin:/sbin"}
 
 # Programs that only other programs start.
-PROGRAMS = "usr/lib/{}/gaitwright/".format(sysconfig.get_config_var("MULTIARCH"))
+LIBRARIES = "usr/lib/{}/".format(sysconfig.get_config_var("MULTIARCH"))
+PROGRAMS = LIBRARIES + "gaitwright/"
 # What a user has of each package, beside its manual, its licence and its list of changes.
 CONTENT = {
     "gaitwright": ["usr/bin/gaitwright", "usr/share/gaitwright/base.htr", "usr/share/gaitwright/KsBone.bsm",
@@ -32,7 +33,9 @@ CONTENT = {
                   "usr/share/icons/hicolor/scalable/apps/gaitforge.svg",
                   "usr/share/metainfo/org.example.GaitForge.metainfo.xml"],
     "gaitwright-import": [PROGRAMS + "gaitwright-import"],
-    "libgaitwright-dev": ["usr/include/gaitwright/app/ConvertMotionFile.h"],
+    "libgaitwright2.0": [LIBRARIES + "libgaitwright.so.2.0"],
+    "libgaitwright-dev": ["usr/include/gaitwright/gaitwright.h", LIBRARIES + "libgaitwright.so",
+                          LIBRARIES + "pkgconfig/gaitwright.pc", LIBRARIES + "cmake/Gaitwright/GaitwrightConfig.cmake"],
 }
 
 
@@ -120,7 +123,7 @@ class Root(unittest.TestCase):
 
     def test_what_is_loaded_by_name_lies_beside_the_program(self):
         beside = (self.root / "usr/bin/gaitwright").resolve().parent
-        modules = {path.name for path in PROGRAM.parent.glob("*.so")}
+        modules = {path.name for path in PROGRAM.parent.glob("gw_*.so")}
         self.assertTrue(modules)
         self.assertEqual({path.name for path in beside.glob("*.so")}, modules)
 
