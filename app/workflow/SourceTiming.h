@@ -42,8 +42,7 @@ enum class EPictures : uint8_t
 /// the scene unchanged and returns false. `progress` is called with the number of bytes read and the total;
 /// it may throw to end the reading, which leaves the scene unchanged too.
 bool LoadSourceScene(const std::string& path, COrrinStream& scene, CFailureRecord& record,
-                     std::function<void(size_t, size_t)> progress = {},
-                     EPictures pictures = EPictures::Read);
+                     std::function<void(size_t, size_t)> progress = {}, EPictures pictures = EPictures::Read);
 
 /// Returns the first plain node under a container's root, or null.
 CNode* FirstNode(CObject* root);
