@@ -193,6 +193,7 @@ void CGaitConvertContent::ShowSource()
     if (m_bSourceIsContainer)
         AttachBoneMeshes(root);
     m_kNextSteps.FindUp(root, Timing());
+    m_kNextSteps.SetUndraftable(false);
     SetScene(m_pkSourceView.get(), root,
              m_bSourceIsContainer ? TimingOf(PreviewTrack(root)) : TimingOf(m_kSourceMotion));
     LoadMotion(m_kBaseMotion, BaseFile());

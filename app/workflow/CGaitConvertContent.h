@@ -211,6 +211,7 @@ private:
     std::string FreeName(const std::string& name) const;
     void NotifyOfFindings(const std::string& path);
     void OpenMendedCopy();
+    void UseSureMap();
 
     // Offers.cpp
     void NotifyOfPose();

@@ -84,6 +84,11 @@ Hint CNextSteps::ResultHint(const StepState& state) const
 void CNextSteps::OfferMap(Hint& hint) const
 {
     const ProfileChoice* const best = m_kFits.Best();
+    if (!best && m_bUndraftable)
+    {
+        hint.text += "No map fits this skeleton, and none can be drafted. Choose any map, and edit it.";
+        return;
+    }
     if (!best)
     {
         hint.text += "No map fits this skeleton.";

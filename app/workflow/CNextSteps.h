@@ -38,6 +38,8 @@ public:
     void MeasureFits(std::span<const std::string> folders, CNode* source, CNode* target);
     /// Finds the up axis of a motion. Leaves it in the pose of time 0.
     void FindUp(CNode* root, const SourceTiming& timing);
+    /// Sets whether drafting a bone map for the source has failed; it is not offered again then.
+    void SetUndraftable(bool undraftable) { m_bUndraftable = undraftable; }
     /// Sets the file that OpenMendedCopy repairs; empty if there is nothing to repair.
     void SetMendable(const std::string& path) { m_kMendable = path; }
 
@@ -61,6 +63,7 @@ private:
     CMapFits m_kFits;
     std::string m_kUpAxis;
     std::string m_kMendable;
+    bool m_bUndraftable = false;
 };
 
 /// Returns the first lines of the first error among the notices of a step; empty without an error.

@@ -67,8 +67,10 @@ int CGaitConvertContent::DraftProfile()
         return 0;
     const CWaitCursor wait(window_);
     const SuggestedProfile draft = SuggestProfile(*SourceRoot(), *target);
+    m_kNextSteps.SetUndraftable(!draft.missing.empty());
     if (!draft.missing.empty())
     {
+        ShowCaptions();
         window_.ShowMessageBox(kOwnMessage,
                                "No human body was found in this motion, so no bone map can be drafted.",
                                EButtons::OK);
@@ -111,7 +113,7 @@ void CGaitConvertContent::NotifyOfFindings(const std::string& path)
     }
 }
 
-// The copy is a new file next to the original.
+// The copy is a new file next to the original. It is opened on request, so the way to a result is shortened.
 void CGaitConvertContent::OpenMendedCopy()
 {
     const std::string original = m_kNextSteps.Mendable();
@@ -127,11 +129,19 @@ void CGaitConvertContent::OpenMendedCopy()
     CSafeFile::KeepExisting(path);
     if (exam.WriteMended(path))
     {
-        Open(path);
+        if (Open(path) != 0)
+            UseSureMap();
         return;
     }
     window_.Notify(MakeNotice(path, {.reason = EFailure::WriteError, .systemError = TakeSystemError()}));
     window_.ShowMessageBox(kOwnMessage, "The mended copy cannot be written.", EButtons::OK);
+}
+
+void CGaitConvertContent::UseSureMap()
+{
+    const ProfileChoice* const best = m_kNextSteps.Fits().Best();
+    if (m_kProfilePath.empty() && best && best->verdict.sureness == ESureness::Sure)
+        UseBestMap();
 }
 
 } // namespace gw

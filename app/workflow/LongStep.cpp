@@ -24,8 +24,11 @@ void CGaitConvertContent::ShowProgress(const char* verb, size_t done, size_t tot
 {
     if (!window_.IsProgressDue())
         return;
-    const std::string amount = total > 0 ? std::to_string(100 * done / total) + " %" : "...";
-    const std::string text = m_kTitle.empty() ? std::string(verb) + ' ' + amount : m_kTitle + ", " + amount;
+    std::string text = m_kTitle.empty() ? verb : m_kTitle;
+    if (total > 0)
+        text += (m_kTitle.empty() ? " " : ", ") + std::to_string(100 * done / total) + " %";
+    else
+        text += "...";
     ShowTitle(m_bCancelable ? text + " (Esc cancels)" : text);
     m_bProgressShown = true;
     window_.StayPainted();

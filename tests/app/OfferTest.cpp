@@ -80,6 +80,9 @@ TEST_F(Offers, AFailedConversionIsSavedByTheMapThatFits)
     m_kWindow.m_kAnswers[139] = EAnswer::No;
     Do("open strange.bvh");
     EXPECT_EQ(RemediesOf(m_kWindow.m_kHints["#cnt2"].offers), std::vector{ERemedy::DraftMap});
+    m_kContent.TakeOffer();
+    EXPECT_THAT(m_kWindow.m_kHints["#cnt2"].text, HasSubstr("none can be drafted"));
+    EXPECT_TRUE(m_kWindow.m_kHints["#cnt2"].offers.empty());
 }
 
 TEST_F(Offers, OnlyTheBonesOfTheChosenMapAreMarked)
