@@ -20,7 +20,7 @@ namespace gw {
 
 namespace {
 
-constexpr size_t kMissingShown = 3; // of the bones that a map names and the skeleton lacks
+constexpr size_t kLinesShown = 5; // what is wrong, three missing bones, and the number of the others
 
 // Returns the name of an axis that is not +Y: "Z", "-Z". A tilted one has the name of the closest axis.
 std::string AxisName(const Vec3& up)
@@ -173,7 +173,7 @@ std::string SummaryOf(std::span<const Notice> notices)
     size_t more = 0;
     for (std::string_view line; NextLine(rest, line);)
     {
-        if (shown <= kMissingShown)
+        if (shown < kLinesShown)
             summary.append(shown++ > 0 ? "\n" : "").append(line);
         else
             ++more;

@@ -41,7 +41,8 @@ std::string NearestLines(const CProfileFit& fit)
                           [](const MissingBone& bone) { return !bone.nearest.empty(); });
     const size_t named = std::min(bones.size(), kNamed);
     const std::string lines = Lines(std::span(bones).first(named));
-    return bones.size() == named ? lines : lines + "\n  " + std::to_string(bones.size() - named) + " more";
+    return bones.size() == named ? lines
+                                 : lines + "\n  and " + std::to_string(bones.size() - named) + " more";
 }
 
 } // namespace

@@ -294,16 +294,26 @@ TEST_F(ContentTest, DropsAndRecentFilesOpenAsTheDialogDoes)
     EXPECT_TRUE(m_kContent.IsConverted());
 }
 
-TEST_F(ContentTest, ALongConversionTellsItsProgressInTheTitle)
+TEST_F(ContentTest, LongStepsTellTheirProgressInTheTitle)
 {
     Write("walk.bvh", BvhText(kPoserBones, 200));
+    WriteContainer("scene.orn");
+    m_kWindow.saveAnswer = m_kFolder.Path("walk.Kinetra");
     Do("open walk.bvh");
     m_kWindow.m_bProgressDue = true;
-    m_kWindow.m_kTitles.clear();
-    Do("click convert");
-    ASSERT_GE(m_kWindow.m_kTitles.size(), 3u);
-    EXPECT_EQ(m_kWindow.m_kTitles[1], "Gaitwright v2.0 - Converting 32 % (Esc cancels)");
-    EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+    const std::tuple<const char*, const char*> rows[] = {
+        {"click convert", "Gaitwright v2.0 - Converting 32 % (Esc cancels)"},
+        {"click apply", "Gaitwright v2.0 - Saving 49 % (Esc cancels)"},
+        {"open scene.orn", "Gaitwright v2.0 - Opening 100 % (Esc cancels)"},
+    };
+    for (const auto& [step, title] : rows)
+    {
+        m_kWindow.m_kTitles.clear();
+        Do(step);
+        EXPECT_EQ(std::ranges::count(m_kWindow.m_kTitles, title), 1)
+            << step << ": " << testing::PrintToString(m_kWindow.m_kTitles);
+        EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
+    }
 }
 
 } // namespace gw
