@@ -6,6 +6,7 @@
 #include "CMapRowTable.h"
 #include "CNode.h"
 #include "Captions.h"
+#include "Directions.h"
 #include "DoubtWords.h"
 #include "FindBodyByNames.h"
 #include "FindBone.h"
@@ -14,24 +15,13 @@
 #include "UpAxis.h"
 
 #include <algorithm>
-#include <cmath>
+#include <string_view>
 
 namespace gw {
 
 namespace {
 
 constexpr size_t kLinesShown = 5; // what is wrong, three missing bones, and the number of the others
-
-// Returns the name of an axis that is not +Y: "Z", "-Z". A tilted one has the name of the closest axis.
-std::string AxisName(const Vec3& up)
-{
-    const double size[] = {std::fabs(up.x), std::fabs(up.y), std::fabs(up.z)};
-    const size_t axis = static_cast<size_t>(std::ranges::max_element(size) - size);
-    const float value = axis == 0 ? up.x : axis == 1 ? up.y : up.z;
-    std::string name(value < 0.0f ? "-" : "");
-    name += "XYZ"[axis];
-    return name == "Y" ? "" : name;
-}
 
 } // namespace
 
@@ -48,8 +38,9 @@ void CNextSteps::FindUp(CNode* root, const SourceTiming& timing)
     m_kUpAxis.clear();
     if (!root || !(timing.frequency > 0.0f) || !(timing.lastFrame >= 0.0f))
         return;
-    m_kUpAxis = AxisName(
-        FindUpAxis(FindBodyByNames(*root), timing.frequency, static_cast<int>(timing.lastFrame) + 1));
+    const std::string_view up = AxisName(NearestAxis(
+        FindUpAxis(FindBodyByNames(*root), timing.frequency, static_cast<int>(timing.lastFrame) + 1)));
+    m_kUpAxis = up == "Y" ? "" : up;
     root->UpdateScene(0.0f, true);
 }
 

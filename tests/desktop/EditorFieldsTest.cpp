@@ -34,21 +34,16 @@ TEST_F(EditorFields, EnterCommitsARateAndKeepsTheWindow)
     EXPECT_TRUE(IsEnabled(kSaveProfileButton));
 }
 
-TEST_F(EditorFields, AMessageThatTakesTheFocusIsShownOnce)
-{
-    m_kWindow.onBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
-    Type(kNameField, "mine");
-    Child<QLineEdit>(kFrameRateField).setFocus();
-    EXPECT_EQ(m_kWindow.TakeWords(), "158");
-}
-
-TEST_F(EditorFields, AMenuOverAFieldTakesNothingAway)
+TEST_F(EditorFields, ANameIsRefusedOnceItsFieldIsLeft)
 {
     Type(kNameField, "mine");
     QFocusEvent menu(QEvent::FocusOut, Qt::PopupFocusReason);
     QApplication::sendEvent(&Child<QLineEdit>(kNameField), &menu);
     EXPECT_EQ(m_kWindow.TakeWords(), "");
-    EXPECT_EQ(Field(kNameField), "mine") << "still being typed";
+    EXPECT_EQ(Field(kNameField), "mine") << "still being typed, under a menu";
+    m_kWindow.onBox = [this] { Child<QLineEdit>(kFrameRateField).clearFocus(); };
+    Child<QLineEdit>(kFrameRateField).setFocus();
+    EXPECT_EQ(m_kWindow.TakeWords(), "158") << "although the message takes the focus again";
 }
 
 TEST_F(EditorFields, UndoTakesBackTypingInAFieldAndCommandsOutsideIt)

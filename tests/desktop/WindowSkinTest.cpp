@@ -42,4 +42,23 @@ TEST(Skin, SaysWhatIsMissingOrWrong)
     EXPECT_THAT(problem, testing::HasSubstr("/nowhere/bvh.cnt"));
 }
 
+TEST(Skin, ShrinksToTheScreen)
+{
+    const std::tuple<QSize, QSize> rows[] = {
+        {{1024, 768}, {1000, 630}}, // room enough
+        {{683, 512}, {683, 430}},   // 1024 x 768 at a scale of 1.5
+        {{400, 300}, {500, 315}},   // smaller would not be readable
+    };
+    for (const auto& [screen, size] : rows)
+    {
+        CSkin skin;
+        std::string problem;
+        ASSERT_TRUE(skin.Load(ExecutableFolder() + "Content/", problem)) << problem;
+        skin.ShrinkTo(screen);
+        EXPECT_EQ(skin.Size(), size);
+        for (const SkinChild& child : skin.Children())
+            EXPECT_TRUE(QRect(QPoint(), size).contains(child.place)) << child.name;
+    }
+}
+
 } // namespace gw

@@ -85,6 +85,10 @@ float HeightOf(const Places& places)
     return high->second.y - low->second.y;
 }
 
+struct CStopped
+{
+};
+
 } // namespace
 
 // Models of others, and one of our own, which needs no data.
@@ -170,6 +174,10 @@ TEST(Import, AWrittenMotionComesBack)
         EXPECT_EQ(copy.GetKeyCount(), motion.GetKeyCount());
         EXPECT_NEAR(copy.GetFrequency(), motion.GetFrequency(), 1e-5);
         EXPECT_EQ(copy.imported.unitMeters, 1.0);
+        const Ref<CNode> root = copy.motionRoot;
+        copy.SetProgress([](size_t, size_t) { throw CStopped(); });
+        EXPECT_THROW(copy.Load(folder.Path("walk.glb")), CStopped);
+        EXPECT_EQ(copy.motionRoot, root) << "a canceled import changes nothing";
         const std::vector<CNode*> joints = NodesOf(*motion.motionRoot);
         const std::vector<CNode*> copies = NodesOf(*copy.motionRoot);
         ASSERT_EQ(copies.size(), joints.size());

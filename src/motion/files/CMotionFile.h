@@ -34,9 +34,9 @@ public:
     /// unchanged. For any other extension, returns true if a motion is already loaded, otherwise false. The
     /// tree is left at time 0.
     virtual bool Load(const std::string& path);
-    /// Sets a function that Load, Save and SaveText call from time to time with how much is done and the total,
-    /// or with a total of 0 if that is unknown. It may throw to end the step: then Load leaves the trees
-    /// unchanged, Save the file.
+    /// Sets a function that Load, Save and SaveText call from time to time with how much is done and the
+    /// total, or with a total of 0 if that is unknown. It may throw to end the step: then Load leaves the
+    /// trees unchanged, Save the file.
     void SetProgress(std::function<void(size_t, size_t)> progress) { progress_ = std::move(progress); }
     /// Writes an HTR file with frameScale times as many frames. Returns false for other extensions and on
     /// failure.
