@@ -5,7 +5,6 @@
 #include <QScrollBar>
 #include <QTest>
 #include <gmock/gmock.h>
-#include <ranges>
 
 namespace gw {
 
@@ -108,8 +107,11 @@ TEST_F(EditorRows, TreesStayAsTheyAreWhileOnlyMarkersChange)
 TEST_F(EditorRows, TheListScrollsNeitherAtAClickNorAtARemoval)
 {
     std::string many;
-    for (const int row : std::views::iota(0, 200))
-        many += "a" + std::to_string(row) + " x t" + std::to_string(row) + " 0\n";
+    for (int row = 0; row < 200; ++row)
+    {
+        const std::string number = std::to_string(row);
+        many.append("a").append(number).append(" x t").append(number).append(" 0\n");
+    }
     Use(many);
     QScrollBar& bar = *Child<CMapRowView>(kMapRowList).verticalScrollBar();
     bar.setValue(100);
