@@ -27,7 +27,7 @@ namespace gw {
 
 namespace {
 
-constexpr int kProgressMilliseconds = 150; // shorter operations show no progress
+constexpr int kProgressMilliseconds = 100; // shorter operations show no progress
 constexpr int kCornerSide = 32;            // side of the icon's corner, in pixels
 
 } // namespace
