@@ -155,6 +155,8 @@ public:
     template <class Slots>
     void Links(const char* name, Slots& slots)
     {
+        if (m_pkHeld)
+            return LinkEach(name, slots);
         slots.resize(Count(name, slots.size(), 4));
         LinkRow(name, slots);
     }
@@ -163,13 +165,7 @@ public:
     void LinkRow(const char* name, Slots& slots)
     {
         BeginArray(name, EListKind::Links);
-        for (auto& slot : slots)
-        {
-            if constexpr (requires { slot.Set(nullptr); })
-                PlainLink(name, slot);
-            else
-                Link(name, slot);
-        }
+        LinkEach(name, slots);
         EndArray();
     }
 
@@ -254,6 +250,17 @@ private:
     }
     template <class T>
     void Elements(const char* name, std::vector<T>& values, size_t count);
+    template <class Slots>
+    void LinkEach(const char* name, Slots& slots)
+    {
+        for (auto& slot : slots)
+        {
+            if constexpr (requires { slot.Set(nullptr); })
+                PlainLink(name, slot);
+            else
+                Link(name, slot);
+        }
+    }
 
     CVersion m_kVersion;
     bool m_bReading;
@@ -317,9 +324,12 @@ void CFieldArchive::Block(const char* name, CKeyArray<T>& keys)
 template <class T, class F>
 void CFieldArchive::Array(const char* name, std::vector<T>& elements, F fields)
 {
+    if (std::is_trivially_copyable_v<T> && m_bLinksOnly) // has no links
+        return;
     T least{};
     CFieldCounter counter;
-    fields(counter, least);
+    if (IsReading())
+        fields(counter, least);
     elements.resize(Count(name, elements.size(), static_cast<size_t>(counter.ByteCount())));
     BeginArray(name, EListKind::Records);
     for (T& element : elements)

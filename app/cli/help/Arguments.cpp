@@ -20,6 +20,7 @@
 #include <cstdio>
 #include <functional>
 #include <optional>
+#include <span>
 
 namespace gw {
 
@@ -146,11 +147,30 @@ CLI::Validator FrameRange()
     return CLI::Validator(check, "A-B");
 }
 
-void AddOptions(CLI::App& app, const ShellCommand& command, ShellOptions& options)
+// Returns whether an argument can refer to an option. Short names can be joined, as in "-fq".
+bool RefersTo(std::string_view argument, const OptionRow& row)
 {
+    std::string_view rest = row.names;
+    for (std::string_view name = NextToken(rest); !name.empty(); name = NextToken(rest))
+    {
+        const bool isLong = name.starts_with("--");
+        if (isLong ? argument.starts_with(name)
+                   : argument.starts_with('-') && argument.find(name.back()) != argument.npos)
+            return true;
+    }
+    return false;
+}
+
+// Registers a command's options, except those that make no difference because no argument refers to them: the
+// parser compares each new option with all others, which takes a twentieth of a small conversion.
+void AddOptions(CLI::App& app, const ShellCommand& command, std::span<char* const> arguments,
+                ShellOptions& options)
+{
+    const uint64_t always = command.required | command.choice;
     for (const OptionRow& row : OptionTable())
     {
-        if (!(OptionsOf(command) & row.bit))
+        const auto refers = [&](const char* argument) { return RefersTo(argument, row); };
+        if (!(OptionsOf(command) & row.bit) || !(always & row.bit || std::ranges::any_of(arguments, refers)))
             continue;
         CLI::Option* option = std::visit(OptionBinder(app, row, options), row.target);
         option->required((command.required & row.bit) != 0);
@@ -258,7 +278,7 @@ void NameInFolder(const ShellCommand& command, ShellOptions& options)
 std::optional<EExit> ParseFor(const ShellCommand& command, int argc, char** argv, ShellOptions& options)
 {
     CLI::App app;
-    AddOptions(app, command, options);
+    AddOptions(app, command, std::span(argv, static_cast<size_t>(argc)), options);
     std::string wrong;
     try
     {
