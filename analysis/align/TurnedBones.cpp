@@ -45,9 +45,10 @@ Mat3 RestBone(const CNode& source)
 std::vector<TurnedBone> FindTurnedBones(const CRetargeter& table, CNode& targetRoot)
 {
     std::vector<TurnedBone> bones;
+    const CNodeNames names(targetRoot);
     for (const auto& [name, planted] : kBones)
     {
-        const CNode* const target = FindNode(&targetRoot, name);
+        const CNode* const target = names.Find(name);
         const CNode* const source = table.SourceOf(target);
         if (!target || !source)
             continue;

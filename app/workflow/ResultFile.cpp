@@ -38,7 +38,9 @@ bool WritePackage(CMotionFile& result, const std::string& path, int profileRate,
     const CByteSink append = [&](std::span<const std::byte> bytes) {
         return package.Write(bytes) || record.Fail(package.Failure());
     };
-    const auto write = [&](float frameScale) { return result.SaveText(append, frameScale); };
+    const auto write = [&](float frameScale) {
+        return result.SaveText(append, frameScale, package.TakeHead());
+    };
     if (!package.Open(
             path, {FormatCode(std::string(kMotionExtension)), static_cast<float>(profileRate), kHostRate}))
         return record.Fail(package.Failure());

@@ -10,6 +10,7 @@
 
 #include <cstring>
 #include <string_view>
+#include <utility>
 
 namespace gw {
 
@@ -34,6 +35,11 @@ struct MotionSize
 };
 static_assert(sizeof(MotionSize) == 8);
 
+std::string_view TextOf(std::span<const std::byte> bytes)
+{
+    return {reinterpret_cast<const char*>(bytes.data()), bytes.size()};
+}
+
 Ref<CRawData> MakeBlock(const char* name, std::span<const std::byte> bytes)
 {
     Ref<CRawData> block = new CRawData;
@@ -44,7 +50,7 @@ Ref<CRawData> MakeBlock(const char* name, std::span<const std::byte> bytes)
 }
 
 // Returns a package with an empty motion.
-std::vector<std::byte> EmptyPackage(const PackageInfo& info)
+std::string EmptyPackage(const PackageInfo& info)
 {
     const InfoBlock block{.m_uiFormat = info.format, .m_fThird = info.third, .m_fFourth = info.fourth};
     const Ref<CNode> node = new CNode(1);
@@ -57,9 +63,8 @@ std::vector<std::byte> EmptyPackage(const PackageInfo& info)
     stream.AddRoot(facts.Get());
     std::vector<std::byte> objects;
     stream.SaveBuffer(objects);
-    const std::span<const std::byte> header = COrrinStream::FileHeader();
-    objects.insert(objects.begin(), header.begin(), header.end());
-    return objects;
+    std::string package(TextOf(COrrinStream::FileHeader()));
+    return package += TextOf(objects);
 }
 
 } // namespace
@@ -94,23 +99,37 @@ bool CPackageFile::Keep(bool written)
 bool CPackageFile::Open(const std::string& path, const PackageInfo& info)
 {
     m_eFailure = EFailure::None;
-    m_uiMotionBytes = 0;
-    const std::vector<std::byte> head = EmptyPackage(info);
-    m_uiHeadBytes = head.size();
-    return Keep(m_kFile.Open(path) && m_kFile.Write(head));
+    m_uiBytes = 0;
+    m_kHead = EmptyPackage(info);
+    m_uiHeadBytes = m_kHead.size();
+    return Keep(m_kFile.Open(path));
+}
+
+std::string CPackageFile::TakeHead()
+{
+    return std::exchange(m_kHead, {});
+}
+
+bool CPackageFile::Append(std::span<const std::byte> bytes)
+{
+    m_uiBytes += bytes.size();
+    if (m_uiBytes > kContainerBytesLimit && m_eFailure == EFailure::None)
+        m_eFailure = EFailure::TooLarge;
+    return m_eFailure == EFailure::None && Keep(m_kFile.Write(bytes));
 }
 
 bool CPackageFile::Write(std::span<const std::byte> motion)
 {
-    m_uiMotionBytes += motion.size();
-    if (m_uiHeadBytes + m_uiMotionBytes > kContainerBytesLimit && m_eFailure == EFailure::None)
-        m_eFailure = EFailure::TooLarge;
-    return m_eFailure == EFailure::None && Keep(m_kFile.Write(motion));
+    const std::string head = TakeHead();
+    return (head.empty() || Append(std::as_bytes(std::span(head)))) && Append(motion);
 }
 
 bool CPackageFile::Commit()
 {
-    const MotionSize size{static_cast<uint32_t>(m_uiMotionBytes), m_uiMotionBytes > 0 ? 1u : 0u};
+    if (!m_kHead.empty() && !Write({}))
+        return false;
+    const uint64_t motionBytes = m_uiBytes - m_uiHeadBytes;
+    const MotionSize size{static_cast<uint32_t>(motionBytes), motionBytes > 0 ? 1u : 0u};
     return m_eFailure == EFailure::None &&
            Keep(m_kFile.Rewrite(m_uiHeadBytes - sizeof size, std::as_bytes(std::span(&size, 1))) &&
                 m_kFile.Commit());

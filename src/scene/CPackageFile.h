@@ -27,8 +27,11 @@ uint32_t FormatCode(const std::string& path);
 class CPackageFile
 {
 public:
-    /// Starts writing next to a destination, with everything that precedes the motion.
+    /// Starts writing next to a destination.
     bool Open(const std::string& path, const PackageInfo& info);
+    /// Returns everything that precedes the motion. The caller then puts it at the front of the first Write;
+    /// otherwise, it is written separately.
+    std::string TakeHead();
     /// Appends bytes of the motion. Returns false if they cannot be written or exceed the container limit;
     /// Commit will then fail too.
     bool Write(std::span<const std::byte> motion);
@@ -40,10 +43,12 @@ public:
 
 private:
     bool Keep(bool written);
+    bool Append(std::span<const std::byte> bytes);
 
     CSafeFile m_kFile;
+    std::string m_kHead; // until it is taken or written
     size_t m_uiHeadBytes = 0;
-    uint64_t m_uiMotionBytes = 0;
+    uint64_t m_uiBytes = 0; // with the head
     EFailure m_eFailure = EFailure::None;
 };
 

@@ -147,15 +147,18 @@ CLI::Validator FrameRange()
     return CLI::Validator(check, "A-B");
 }
 
-// Returns whether an argument can refer to an option. Short names can be joined, as in "-fq".
-bool RefersTo(std::string_view argument, const OptionRow& row)
+// Returns whether any argument can refer to an option. Short names can be joined, as in "-fq".
+bool MayBeGiven(const OptionRow& row, std::span<char* const> arguments)
 {
     std::string_view rest = row.names;
     for (std::string_view name = NextToken(rest); !name.empty(); name = NextToken(rest))
     {
-        const bool isLong = name.starts_with("--");
-        if (isLong ? argument.starts_with(name)
-                   : argument.starts_with('-') && argument.find(name.back()) != argument.npos)
+        const auto refers = [=](std::string_view argument) {
+            return name.starts_with("--")
+                       ? argument.starts_with(name)
+                       : argument.starts_with('-') && argument.find(name.back()) != argument.npos;
+        };
+        if (std::ranges::any_of(arguments, refers))
             return true;
     }
     return false;
@@ -169,8 +172,7 @@ void AddOptions(CLI::App& app, const ShellCommand& command, std::span<char* cons
     const uint64_t always = command.required | command.choice;
     for (const OptionRow& row : OptionTable())
     {
-        const auto refers = [&](const char* argument) { return RefersTo(argument, row); };
-        if (!(OptionsOf(command) & row.bit) || !(always & row.bit || std::ranges::any_of(arguments, refers)))
+        if (!(OptionsOf(command) & row.bit) || !(always & row.bit || MayBeGiven(row, arguments)))
             continue;
         CLI::Option* option = std::visit(OptionBinder(app, row, options), row.target);
         option->required((command.required & row.bit) != 0);

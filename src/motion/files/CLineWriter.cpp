@@ -2,22 +2,31 @@
 
 #include <cmath>
 #include <cstring>
+#include <utility>
 
 namespace gw {
 
+void CLineWriter::Send(size_t begin, size_t byteCount)
+{
+    if (byteCount > 0 && !m_bRefused)
+        m_bRefused = !m_kSink(std::as_bytes(std::span(m_kBuffer).subspan(begin, byteCount)));
+}
+
 bool CLineWriter::Flush()
 {
-    if (m_uiUsed > 0 && !m_bRefused)
-        m_bRefused = !m_kSink(std::as_bytes(std::span(m_kBuffer).first(m_uiUsed)));
-    m_uiUsed = 0;
+    Send(0, std::exchange(m_uiUsed, 0));
     return !m_bRefused;
 }
 
 char* CLineWriter::MakeRoom(size_t byteCount)
 {
-    Flush();
-    if (m_kBuffer.size() < byteCount)
-        m_kBuffer.resize(byteCount);
+    size_t sent = 0;
+    for (; m_uiUsed - sent >= kPieceBytes; sent += kPieceBytes)
+        Send(sent, kPieceBytes);
+    m_uiUsed -= sent;
+    std::memmove(m_kBuffer.data(), m_kBuffer.data() + sent, m_uiUsed);
+    if (m_kBuffer.size() - m_uiUsed < byteCount)
+        m_kBuffer.resize(m_uiUsed + byteCount);
     return m_kBuffer.data() + m_uiUsed;
 }
 

@@ -17,7 +17,9 @@ inline constexpr std::string_view kTextLineEnd =
     "\n";
 #endif
 
-/// Writes lines of text to a sink in pieces, so the whole text is never in memory.
+/// Writes lines of text to a sink in pieces, so the whole text is never in memory. All pieces but the last
+/// have the same size, a power of two: a file system stores a file that grows in such steps in fewer, larger
+/// pages.
 class CLineWriter
 {
 public:
@@ -47,10 +49,13 @@ public:
 private:
     char* MakeRoom(size_t byteCount);
 
+    void Send(size_t begin, size_t byteCount);
+
     static constexpr size_t kPieceBytes = size_t{1} << 16; // fits into a core's cache
+    static constexpr size_t kSpareBytes = 4096;            // for the line that completes a piece
 
     CByteSink m_kSink;
-    std::string m_kBuffer = std::string(kPieceBytes, '\0');
+    std::string m_kBuffer = std::string(kPieceBytes + kSpareBytes, '\0');
     size_t m_uiUsed = 0;
     bool m_bRefused = false;
 };

@@ -136,10 +136,10 @@ bool CMotionFile::Save(const std::string& path, float frameScale)
     return SaveBy([&](TKHTRStream& stream) { return stream.Save(path, frameScale); });
 }
 
-bool CMotionFile::SaveText(const CByteSink& sink, float frameScale)
+bool CMotionFile::SaveText(const CByteSink& sink, float frameScale, std::string_view head)
 {
     m_kRecord.Clear();
-    return SaveBy([&](TKHTRStream& stream) { return stream.SaveText(sink, frameScale); });
+    return SaveBy([&](TKHTRStream& stream) { return stream.SaveText(sink, frameScale, head); });
 }
 
 bool CMotionFile::SaveBy(const std::function<bool(TKHTRStream&)>& save)

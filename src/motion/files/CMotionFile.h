@@ -11,6 +11,7 @@
 #include <cstddef>
 #include <functional>
 #include <string>
+#include <string_view>
 #include <utility>
 
 namespace gw {
@@ -41,8 +42,8 @@ public:
     /// Writes an HTR file with frameScale times as many frames. Returns false for other extensions and on
     /// failure.
     virtual bool Save(const std::string& path, float frameScale);
-    /// Sends the text of that HTR file to a sink, in pieces.
-    virtual bool SaveText(const CByteSink& sink, float frameScale);
+    /// Sends the text of that HTR file to a sink, in pieces. The first one starts with `head`.
+    virtual bool SaveText(const CByteSink& sink, float frameScale, std::string_view head);
 
     /// End time of the first control in frames, or 0.
     float GetLastFrame() const;

@@ -285,16 +285,16 @@ bool TKHTRStream::FillHeader(TKHTRFile& file, float frameScale)
 
 bool TKHTRStream::Save(const std::string& path, float frameScale)
 {
-    return SaveTo(path, frameScale);
+    return SaveTo(path, frameScale, {});
 }
 
-bool TKHTRStream::SaveText(const CByteSink& sink, float frameScale)
+bool TKHTRStream::SaveText(const CByteSink& sink, float frameScale, std::string_view head)
 {
-    return SaveTo(sink, frameScale);
+    return SaveTo(sink, frameScale, head);
 }
 
 template <class T>
-bool TKHTRStream::SaveTo(const T& destination, float frameScale)
+bool TKHTRStream::SaveTo(const T& destination, float frameScale, std::string_view head)
 {
     m_kRecord.Clear();
     if (!restRoot || !motionRoot)
@@ -307,7 +307,8 @@ bool TKHTRStream::SaveTo(const T& destination, float frameScale)
 
     CRows rows(file, *motionRoot, quarterTurns, FrameTimes(file.numFrames, GetFrequency(), frameScale),
                [this](size_t done, size_t total) { Report(done, total); });
-    const bool written = WriteLines(destination, TextOf(file, rows, m_kRecord));
+    const auto text = TextOf(file, rows, m_kRecord);
+    const bool written = WriteLines(destination, [&](CLineWriter& out) { return text(out.Text(head)); });
     motionRoot->UpdateScene(0.0f, true);
     return written;
 }

@@ -26,7 +26,7 @@ public:
     /// rate. Returns false if a tree is missing or the file cannot be written. Leaves the motion switched on,
     /// at time 0.
     bool Save(const std::string& path, float frameScale) override;
-    bool SaveText(const CByteSink& sink, float frameScale) override;
+    bool SaveText(const CByteSink& sink, float frameScale, std::string_view head) override;
     /// Gives a node the bone mesh of its segment.
     virtual void AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node);
 
@@ -38,7 +38,7 @@ private:
 
     bool FillHeader(TKHTRFile& file, float frameScale);
     template <class T>
-    bool SaveTo(const T& destination, float frameScale);
+    bool SaveTo(const T& destination, float frameScale, std::string_view head);
 };
 
 } // namespace gw

@@ -74,10 +74,13 @@ struct LegWalk
 
 void CRetargeter::MeasureBody(float& scale, float& footRise, float weight) const
 {
-    const CNode* torso = FindNode(m_pkTargetRoot, kRootBone);
-    const CNode* leftFoot = FindNode(m_pkTargetRoot, kLeftBones.foot);
-    const CNode* rightFoot = FindNode(m_pkTargetRoot, kRightBones.foot);
-    const CNode* leftThigh = FindNode(m_pkTargetRoot, kLeftBones.thigh);
+    if (!m_pkTargetRoot)
+        return;
+    const CNodeNames names(*m_pkTargetRoot);
+    const CNode* torso = names.Find(kRootBone);
+    const CNode* leftFoot = names.Find(kLeftBones.foot);
+    const CNode* rightFoot = names.Find(kRightBones.foot);
+    const CNode* leftThigh = names.Find(kLeftBones.thigh);
     const CNode* sourceHip = SourceOf(m_pkTargetRoot);
     const CNode* sourceLFoot = SourceOf(leftFoot);
     const CNode* sourceRFoot = SourceOf(rightFoot);

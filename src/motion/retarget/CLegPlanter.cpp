@@ -41,15 +41,16 @@ CLegPlanter::CLegPlanter(const CRetargeter& retargeter, CPoseMatcher& matcher, C
 {
     if (!m_pkSourcePelvis)
         return;
+    const CNodeNames names(targetRoot);
     for (const HostSide& side : kHostSides)
-        Plan(retargeter, targetRoot, side);
+        Plan(retargeter, names, side);
 }
 
-bool CLegPlanter::Plan(const CRetargeter& retargeter, CNode& targetRoot, const HostSide& side)
+bool CLegPlanter::Plan(const CRetargeter& retargeter, const CNodeNames& names, const HostSide& side)
 {
     const auto& bones = matcher_.Bones();
-    const int thigh = matcher_.IndexOf(FindNode(&targetRoot, side.thigh));
-    const int foot = matcher_.IndexOf(FindNode(&targetRoot, side.foot));
+    const int thigh = matcher_.IndexOf(names.Find(side.thigh));
+    const int foot = matcher_.IndexOf(names.Find(side.foot));
     const int calf = foot < 0 ? -1 : bones[Index(foot)].parent;
     if (thigh < 0 || calf < 0 || bones[Index(calf)].parent < 0)
         return false;

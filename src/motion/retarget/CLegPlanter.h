@@ -9,6 +9,7 @@ namespace gw {
 
 class CFaithfulLeg;
 class CKeyframeControl;
+class CNodeNames;
 struct HostSide;
 
 /// Plants the feet: rotates thigh and calf of each leg so that the ankle's position relative to the pelvis
@@ -40,7 +41,7 @@ private:
         std::vector<size_t> path; ///< from the root down to the calf
     };
 
-    bool Plan(const CRetargeter& retargeter, CNode& targetRoot, const HostSide& side);
+    bool Plan(const CRetargeter& retargeter, const CNodeNames& names, const HostSide& side);
     void UpdatePath(const LegRecord& leg);
     Vec3 HintPoint(const LegRecord& leg) const;
     void LegGoal(const LegRecord& leg, float scale, Vec3& goal, Vec3& hint) const;

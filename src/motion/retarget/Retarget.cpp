@@ -50,6 +50,8 @@ uint64_t KeyBytesOf(CNode& root)
 
 bool IsInProportion(uint64_t resultBytes, CNode& source)
 {
+    if (resultBytes <= kAnyResultBytes)
+        return true;
     const uint64_t expected = kAnyResultBytes + kResultBytesPerSourceByte * KeyBytesOf(source);
     return resultBytes <= std::min(expected, kResultBytesLimit);
 }
