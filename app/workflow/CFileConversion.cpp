@@ -23,6 +23,7 @@ CFileConversion::CFileConversion(const std::string& dataFolder, const Conversion
                                  NoticeListener listener)
     : platform_(EPlatformWriting::No, dataFolder), choices_(choices), notify_(std::move(listener))
 {
+    result_.boneMeshes = EBoneMeshes::DrawnInMotion; // its lowest point is put on the floor
 }
 
 std::string CFileConversion::Message(int id) const

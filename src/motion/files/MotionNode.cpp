@@ -44,7 +44,7 @@ CBoneMesh& AttachBone(CNode& node, const std::string& name, size_t childCount, f
         mesh = new CBoneShapeMesh;
     node.AttachChild(mesh);
     mesh->SetName(name.c_str());
-    if (meshes == EBoneMeshes::Drawn)
+    if (meshes != EBoneMeshes::Empty)
         mesh->Build(length);
     else if (length > 0.0f)
         mesh->m_fLength = length;

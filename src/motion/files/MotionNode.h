@@ -39,7 +39,8 @@ CKeyframeControl& AttachTrack(CNode& node, int frameCount, float frequency, cons
 enum class EBoneMeshes : uint8_t
 {
     Drawn,
-    Empty, ///< without points, for a source that is not shown
+    DrawnInMotion, ///< those of the rest tree without points, for a target that is not shown
+    Empty,         ///< without points, for a source that is not shown
 };
 
 /// Gives a node a bone mesh with a name and length: a ball if the bone has more than one child, otherwise a

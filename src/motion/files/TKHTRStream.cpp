@@ -120,7 +120,10 @@ void TKHTRStream::FillAnimatedNode(const TKHTRFile& file, TKHTRSegment& segment,
 
 void TKHTRStream::AddBoneShape(const TKHTRFile& file, const TKHTRSegment& segment, CNode& node)
 {
-    CBoneMesh& mesh = AttachBone(node, segment.name, segment.children.size(), segment.boneLength, boneMeshes);
+    const bool isAtRest = !node.GetControl();
+    const EBoneMeshes meshes =
+        isAtRest && boneMeshes == EBoneMeshes::DrawnInMotion ? EBoneMeshes::Empty : boneMeshes;
+    CBoneMesh& mesh = AttachBone(node, segment.name, segment.children.size(), segment.boneLength, meshes);
     mesh.m_kMatrix = Mat4Compose(UpAxisMatrix(file.boneLengthAxis), kVec3Zero);
 }
 
