@@ -12,6 +12,7 @@
 
 #include <cmath>
 #include <gtest/gtest.h>
+#include <span>
 #include <tuple>
 
 namespace gw {
@@ -220,6 +221,23 @@ TEST(TKHTRStream, WritesTheseBytes)
                   "[Header]\nFileType htr\nDataType HTRS\nFileVersion 1\nNumSegments 2\nNumFrames " + frames +
                       Written(torso));
     }
+}
+
+TEST(TKHTRStream, SendsTheSavedTextInPiecesOfOneSize)
+{
+    CLoadedMotion file(kMoving, "a.htr");
+    ASSERT_TRUE(file.motion.Save(file.path, 2000.0f));
+    std::string sent;
+    std::vector<size_t> sizes;
+    const auto sink = [&](std::span<const std::byte> bytes) {
+        sent.append(reinterpret_cast<const char*>(bytes.data()), bytes.size());
+        sizes.push_back(bytes.size());
+        return true;
+    };
+    ASSERT_TRUE(file.motion.SaveText(sink, 2000.0f, "head"));
+    EXPECT_EQ(sent, "head" + ReadBytes(file.path));
+    sizes.pop_back(); // the rest
+    EXPECT_EQ(sizes, std::vector(sizes.size(), size_t{1} << 16));
 }
 
 // The node's local matrix in every frame of a written file at twice the frames, against the tree's own.
