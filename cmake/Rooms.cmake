@@ -36,6 +36,9 @@ function(gw_compile_options target)
             -Woverloaded-virtual)
   if(NOT GAITWRIGHT_SANITIZE AND NOT GAITWRIGHT_FUZZ AND NOT GAITWRIGHT_THREADS)
     gw_harden(${target})
+    # Then the linker can leave out single functions. A smaller program starts faster, because the system maps the
+    # neighbors of each page that is used.
+    target_compile_options(${target} PRIVATE "$<$<CONFIG:Release>:-ffunction-sections>")
   endif()
   if(GAITWRIGHT_THREADS)
     target_compile_options(${target} PRIVATE -O1 -fsanitize=thread -fno-omit-frame-pointer)
