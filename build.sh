@@ -18,6 +18,7 @@ cd "$(dirname "$0")"
 packages_build=(g++ cmake ninja-build pkg-config ccache)
 packages_engine=(libcli11-dev nlohmann-json3-dev libxxhash-dev libmagick++-6.q16-dev libassimp-dev libseccomp-dev)
 packages_preview=(libgl-dev libglu1-mesa-dev libegl-dev libpng-dev libfreetype-dev libfontconfig-dev libgl1-mesa-dri)
+packages_python=(pybind11-dev python3-dev python3-numpy python3-matplotlib)
 packages_desktop=(qt6-base-dev libqt6opengl6-dev qt6-svg-dev libqt6svg6 qt6-qpa-plugins libx11-dev libgl1-mesa-dri fonts-dejavu-core)
 packages_package=(dpkg-dev file lintian desktop-file-utils appstream shared-mime-info man-db)
 packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth xdotool dbus-daemon zsh fish)
@@ -57,7 +58,7 @@ run_tests() {
 }
 
 prepare() {
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" \
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_python[@]}" "${packages_desktop[@]}" "${packages_test[@]}" \
     "${packages_package[@]}" libbenchmark-dev
 }
 
@@ -152,7 +153,7 @@ thread-test)
   TSAN_OPTIONS="halt_on_error=1" build/tsan/bin/library_tests
   ;;
 bench)
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_python[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_bench[@]}"
   build release
   build/release/bin/gaitwright_bench
   python3 bench/whole_process.py build/release/bin --what one four chosen faithful info choice
@@ -170,7 +171,7 @@ cluster-test)
   tests/cluster/cluster_test.sh build/release/bin
   ;;
 lint)
-  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_preview[@]}" "${packages_python[@]}" "${packages_desktop[@]}" "${packages_test[@]}" "${packages_lint[@]}" libbenchmark-dev
   lint "${2:-}"
   ;;
 *)
