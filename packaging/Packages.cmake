@@ -13,6 +13,7 @@ set(CPACK_DEB_COMPONENT_INSTALL ON)
 set(CPACK_DEBIAN_FILE_NAME DEB-DEFAULT)
 set(CPACK_DEBIAN_COMPRESSION_TYPE xz)
 set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS ON)
+set(CPACK_DEBIAN_PACKAGE_SHLIBDEPS_PRIVATE_DIRS ${CMAKE_RUNTIME_OUTPUT_DIRECTORY}) # our own library
 set(CPACK_DEBIAN_PACKAGE_CONTROL_STRICT_PERMISSION ON)
 
 foreach(component package IN ZIP_LISTS GAITWRIGHT_COMPONENTS GAITWRIGHT_PACKAGES)
@@ -76,5 +77,15 @@ set(CPACK_COMPONENT_DEVELOP_DESCRIPTION
     "motion capture converted to one fixed skeleton, development files
 The header of the Gaitwright library, with which programs read, convert,
 measure and write motions, a CMake package and a file for pkg-config.")
+
+# An extension module runs in one version of Python. numpy is loaded with the first array.
+set(CPACK_DEBIAN_PYTHON_PACKAGE_SECTION python)
+set(CPACK_DEBIAN_PYTHON_PACKAGE_DEPENDS
+    "${GAITWRIGHT_LIBRARY} (= ${PROJECT_VERSION}), python3 (>= ${GAITWRIGHT_PYTHON_VERSION}~), \
+python3 (<< ${GAITWRIGHT_PYTHON_NEXT}), python3-numpy")
+set(CPACK_COMPONENT_PYTHON_DESCRIPTION
+    "motion capture converted to one fixed skeleton, Python module
+Reads motions as numpy arrays, moves them onto the target skeleton with a bone
+map, measures the results and writes them.")
 
 include(CPack)
