@@ -12,6 +12,7 @@ import re
 import struct
 import subprocess
 import unittest
+from pathlib import Path
 
 import harness
 from page import Block, Table, code_of, content_of, matches, read_page
@@ -23,6 +24,11 @@ PAGES = [harness.ROOT / "README.md", harness.ROOT / "docs" / "bone-maps.md", har
 # The page about the library needs a compiler, and a library that plain programs can load.
 LIBRARY = {name: os.environ[name] for name in ("PKG_CONFIG_PATH", "LD_LIBRARY_PATH") if name in os.environ}
 PAGES += [harness.ROOT / "docs" / "library.md"] if "PKG_CONFIG_PATH" in LIBRARY else []
+
+# The page about the Python module needs the module, and Debian's own Python with numpy and matplotlib.
+PYTHON = Path("/usr/bin/python3")
+MODULES = os.environ.get("GAITWRIGHT_PYTHON")
+PAGES += [harness.ROOT / "docs" / "python.md"] if MODULES else []
 
 MOST_OTHER_BYTES = 0.005  # of a picture; the bones and axes of a figure are a fiftieth
 
@@ -44,6 +50,8 @@ def decoded(form, content):
 class PageTest(harness.CliTest):
     def work_through(self, path):
         self.set_the_desk()
+        if path.name == "python.md":
+            self.set_the_module()
         for part in read_page(path):
             where = "%s:%d" % (path.relative_to(harness.ROOT), part.line)
             with self.subTest(where):
@@ -65,6 +73,13 @@ class PageTest(harness.CliTest):
         os.symlink(harness.PROGRAM, self.folder / "bin" / "gaitwright")
         self.environment.update(LIBRARY)
         self.environment["PATH"] = "%s:%s" % (self.folder / "bin", self.environment["PATH"])
+
+    def set_the_module(self):
+        """Plots are drawn without a display. The first start of matplotlib may say that it lists the fonts."""
+        (self.folder / "bin" / "python3").symlink_to(PYTHON)
+        self.environment.update(PYTHONPATH=MODULES, MPLBACKEND="Agg", MPLCONFIGDIR=str(self.folder / "matplotlib"))
+        subprocess.run([PYTHON, "-c", "import matplotlib.font_manager"], env=self.environment, capture_output=True,
+                       timeout=harness.SECONDS, check=True)
 
     def take_block(self, block):
         if block.file:
