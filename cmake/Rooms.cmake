@@ -19,7 +19,9 @@ function(gw_harden target)
     set(hardening ${GAITWRIGHT_HARDENING_INNER})
   endif()
   target_compile_options(${target} PRIVATE "$<$<CONFIG:Release>:${hardening}>")
-  target_link_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wl,-z,relro,-z,now>")
+  if(NOT WIN32)
+    target_link_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wl,-z,relro,-z,now>")
+  endif()
 endfunction()
 
 # Compile options that every target of the project shares.
@@ -64,10 +66,17 @@ function(gw_join_sources target)
   endif()
 endfunction()
 
-# gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the current folder.
+# A room's sources for one system only are in a folder below it with that system's name.
+set(GAITWRIGHT_SYSTEM posix)
+if(WIN32)
+  set(GAITWRIGHT_SYSTEM windows)
+endif()
+
+# gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the current folder, and in the one
+# for the system that it is built for.
 function(gw_room name)
   cmake_parse_arguments(ROOM "" "" "PUBLIC;PRIVATE" ${ARGN})
-  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp ${GAITWRIGHT_SYSTEM}/*.cpp)
   file(GLOB headers CONFIGURE_DEPENDS *.h)
   add_library(${name} STATIC ${sources})
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
