@@ -78,18 +78,29 @@ function(gw_room name)
   cmake_parse_arguments(ROOM "" "" "PUBLIC;PRIVATE" ${ARGN})
   file(GLOB sources CONFIGURE_DEPENDS *.cpp ${GAITWRIGHT_SYSTEM}/*.cpp)
   file(GLOB headers CONFIGURE_DEPENDS *.h)
+  file(GLOB system_headers CONFIGURE_DEPENDS ${GAITWRIGHT_SYSTEM}/*.h)
   add_library(${name} STATIC ${sources})
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
+  if(system_headers)
+    target_include_directories(${name}
+      PUBLIC $<BUILD_INTERFACE:${CMAKE_CURRENT_SOURCE_DIR}/${GAITWRIGHT_SYSTEM}>)
+  endif()
   target_link_libraries(${name} PUBLIC ${ROOM_PUBLIC} PRIVATE ${ROOM_PRIVATE})
   target_compile_features(${name} PUBLIC cxx_std_20)
   set_target_properties(${name} PROPERTIES VERIFY_INTERFACE_HEADER_SETS ON)
   gw_join_sources(${name})
+  if(WIN32)
+    # The system's headers define macros with common names, so those who include them are compiled by themselves.
+    file(GLOB system_sources ${GAITWRIGHT_SYSTEM}/*.cpp)
+    set_source_files_properties(${system_sources} PROPERTIES SKIP_UNITY_BUILD_INCLUSION ON)
+  endif()
   gw_compile_options(${name})
 endfunction()
 
-# gw_tests(NAME targets...): one test program of all sources in the current folder.
+# gw_tests(NAME targets...): one test program of all sources in the current folder, and in the one for the system that
+# it is built for.
 function(gw_tests name)
-  file(GLOB sources CONFIGURE_DEPENDS *.cpp)
+  file(GLOB sources CONFIGURE_DEPENDS *.cpp ${GAITWRIGHT_SYSTEM}/*.cpp)
   add_executable(${name} ${sources})
   target_link_libraries(${name} PRIVATE ${ARGN} gw_test_support GTest::gmock GTest::gtest_main)
   gw_compile_options(${name})

@@ -29,7 +29,7 @@ using namespace std::chrono_literals;
 constexpr auto kPatience = 5s; // to wait for a process that was asked to end
 constexpr auto kGlance = 2ms;
 
-void CloseFile(int& file)
+void CloseEnd(int& file)
 {
     if (file >= 0)
         close(std::exchange(file, -1));
@@ -120,7 +120,7 @@ CWorkerProcess::~CWorkerProcess()
         std::this_thread::sleep_for(kGlance);
     }
     for (int* file : {&m_iOutput, &m_iWords, &m_iRecord})
-        CloseFile(*file);
+        CloseEnd(*file);
 }
 
 double CWorkerProcess::RunningSeconds() const
@@ -194,7 +194,7 @@ void CWorkerProcess::Drain(JobEnd& end)
 
 void CWorkerProcess::Close()
 {
-    CloseFile(m_iSocket);
+    CloseEnd(m_iSocket);
 }
 
 } // namespace gw

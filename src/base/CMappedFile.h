@@ -14,7 +14,7 @@ struct WatchedRange;
 
 /// The bytes of a regular file. Large files are mapped, small ones are read, which is cheaper. Folders and
 /// devices are refused. An empty file has no bytes. If the file is truncated while it is mapped, the missing
-/// bytes read as zeros; see IsWhole.
+/// bytes read as zeros; see IsWhole. Windows does not let a mapped file be replaced, so there all are read.
 class CMappedFile
 {
 public:
@@ -43,6 +43,7 @@ private:
     EFailure Take(int file);
     EFailure Read(int file, size_t size);
     EFailure Map(int file, size_t size);
+    void Unmap();
     bool IsMapped() const { return m_pkBytes && !m_spkSmall; }
 
     std::unique_ptr<std::byte[]> m_spkSmall; // the bytes, if they are not mapped

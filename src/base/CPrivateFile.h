@@ -1,6 +1,7 @@
 #pragma once
 
-#include <cstdint>
+#include "Files.h"
+
 #include <string>
 #include <string_view>
 
@@ -42,9 +43,5 @@ private:
     int m_iFile = -1;
     int m_iLiveName = -1; // number of the path in LiveNames
 };
-
-/// Writes all bytes at the descriptor's position or at an offset; false if writing fails.
-bool WriteAll(int file, std::string_view text);
-bool WriteAllAt(int file, std::string_view text, uint64_t offset);
 
 } // namespace gw

@@ -12,16 +12,8 @@
 #include "Paths.h"
 #include "SystemError.h"
 
-#include <cerrno>
-#include <cstdio>
-#include <filesystem>
 #include <set>
-#include <system_error>
 #include <utility>
-
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -30,31 +22,14 @@ namespace {
 constexpr unsigned kModeOfNew = 0666; // minus the user's umask, as for any new file
 constexpr unsigned kModeWhileReplacing = 0600;
 constexpr unsigned kPermissions = 0777; // set-id bits were granted to the old content only
-constexpr unsigned kGroupBits = 070;
 // Not the destination's extension, so that a program that lists files by extension never sees a half-written
 // one.
 constexpr std::string_view kPrivateExtension = ".tmp";
 
-// Returns the end of a chain of symbolic links, whether or not a file exists there. Empty for a cycle.
-std::string FollowLinks(const std::string& path)
-{
-    constexpr int kLinkLimit = 40; // the system's limit
-    std::filesystem::path target(path);
-    for (int i = 0; i < kLinkLimit; ++i)
-    {
-        std::error_code error;
-        const std::filesystem::path next = std::filesystem::read_symlink(target, error);
-        if (error)
-            return target.string();
-        target = target.parent_path() / next;
-    }
-    return {};
-}
-
 bool IsThere(const std::string& path)
 {
-    struct stat status;
-    return lstat(path.c_str(), &status) == 0;
+    FileStatus status;
+    return StatusOfLink(path, status);
 }
 
 // Of this thread, because a thread opens the file that it has asked to keep.
@@ -62,36 +37,6 @@ std::set<std::string>& KeptPaths()
 {
     thread_local std::set<std::string> paths;
     return paths;
-}
-
-// Claims a free name with an empty file, for file systems without hard links. A crash can leave that file
-// behind.
-bool RenameToClaimed(const char* from, const char* to)
-{
-    const int file = open(to, O_WRONLY | O_CREAT | O_EXCL | O_CLOEXEC, kModeWhileReplacing);
-    if (file < 0)
-        return false;
-    close(file);
-    if (rename(from, to) == 0)
-        return true;
-    unlink(to);
-    return false;
-}
-
-// Renames without replacing anything; fails with EEXIST if the destination exists. NFS and some others lack
-// the first call, FAT lacks the second.
-bool RenameToFree(const char* from, const char* to)
-{
-    if (renameat2(AT_FDCWD, from, AT_FDCWD, to, RENAME_NOREPLACE) == 0)
-        return true;
-    if (errno != EINVAL && errno != ENOSYS && errno != ENOTSUP)
-        return false;
-    if (link(from, to) == 0)
-    {
-        unlink(from);
-        return true;
-    }
-    return errno != EEXIST && RenameToClaimed(from, to);
 }
 
 } // namespace
@@ -145,20 +90,20 @@ bool CSafeFile::Open(const std::string& path)
 // Checks that the path is free or holds a file that may be replaced, and records its mode and group.
 bool CSafeFile::MayReplace()
 {
-    struct stat status;
-    if (stat(m_kPath.c_str(), &status) != 0)
+    FileStatus status;
+    if (!StatusOf(m_kPath, status))
     {
-        const bool isFree = errno == ENOENT;
+        const bool isFree = IsNotFound(LastSystemError());
         if (!isFree)
             KeepSystemError();
         return isFree;
     }
-    m_uiMode = status.st_mode & kPermissions;
-    m_uiGroup = status.st_gid;
-    if (!S_ISREG(status.st_mode) || !IsReadOnly(m_kPath))
-        return S_ISREG(status.st_mode);
-    // root may write to a file without write bits, but then nobody is meant to
-    KeepSystemError(access(m_kPath.c_str(), W_OK) == 0 ? EACCES : errno);
+    m_uiMode = status.mode & kPermissions;
+    m_uiGroup = status.group;
+    const bool isRegular = status.kind == EFileKind::Regular;
+    if (!isRegular || !IsReadOnly(m_kPath))
+        return isRegular;
+    KeepSystemError();
     return false;
 }
 
@@ -184,9 +129,9 @@ bool CSafeFile::Commit()
 {
     if (m_kPrivate.File() < 0)
         return false;
-    errno = 0; // a commit that the run refuses has no system error
+    ClearLastSystemError(); // a commit that the run refuses has no system error
     const bool isWritten = !m_bFailed;
-    const bool good = isWritten && KeepOwnership() && Sync() && Rename();
+    const bool good = isWritten && KeepPermissions() && Sync() && Rename();
     if (isWritten && !good)
         KeepSystemError();
     if (good)
@@ -197,43 +142,29 @@ bool CSafeFile::Commit()
     return good;
 }
 
-// If the user may not assign the file to its old group, the new group must not get the old group's
-// permissions.
-bool CSafeFile::KeepOwnership()
+bool CSafeFile::KeepPermissions() const
 {
-    if (m_uiMode == 0)
-        return true;
-    struct stat status;
-    if (fstat(m_kPrivate.File(), &status) != 0)
-        return false;
-    unsigned mode = m_uiMode;
-    if (status.st_gid != m_uiGroup && fchown(m_kPrivate.File(), static_cast<uid_t>(-1), m_uiGroup) != 0)
-        mode = (mode & ~kGroupBits) | (mode & (mode << 3) & kGroupBits);
-    return fchmod(m_kPrivate.File(), mode) == 0;
+    return m_uiMode == 0 || CopyPermissions(m_kPrivate.File(), m_kPath, m_uiMode, m_uiGroup);
 }
 
-// Some file systems report write errors only on close. The lock, and with it the name, stays with the other
-// descriptor.
 bool CSafeFile::Sync() const
 {
     const int file = m_kPrivate.File();
     const bool isLater = ms_bSyncsDeferred && m_uiMode == 0;
     if (isLater) // starts writing to disk now, so the later sync of all files has less to do
-        sync_file_range(file, 0, 0, SYNC_FILE_RANGE_WRITE);
-    if ((!isLater && fsync(file) != 0) || (ms_kCommitGate && !ms_kCommitGate(m_kPrivate.Path())))
+        StartSync(file);
+    if ((!isLater && !SyncFile(file)) || (ms_kCommitGate && !ms_kCommitGate(m_kPrivate.Path())))
         return false;
-    const int copy = fcntl(file, F_DUPFD_CLOEXEC, 0);
-    return copy < 0 || close(copy) == 0;
+    return CloseCopy(file);
 }
 
 bool CSafeFile::Rename()
 {
-    const char* const from = m_kPrivate.Path().c_str();
     if (!m_bKeeps)
-        return rename(from, m_kPath.c_str()) == 0;
-    if (RenameToFree(from, m_kPath.c_str()))
+        return RenameFile(m_kPrivate.Path(), m_kPath);
+    if (RenameToFree(m_kPrivate.Path(), m_kPath))
         return true;
-    if (errno == EEXIST)
+    if (IsNameTaken(LastSystemError()))
         m_eFailure = EFailure::Exists;
     return false;
 }

@@ -58,7 +58,7 @@ public:
 
 private:
     bool MayReplace();
-    bool KeepOwnership();
+    bool KeepPermissions() const;
     bool Sync() const;
     bool Rename();
     void Discard();

@@ -4,39 +4,28 @@
 
 #include "LiveNames.h"
 
-#include <atomic>
-#include <csignal>
-#include <cstring>
+#include "Files.h"
+#include "Processes.h"
 
-#include <unistd.h>
+#include <atomic>
+#include <cstdint>
+#include <cstring>
 
 namespace gw {
 
 namespace {
 
 constexpr size_t kPathBytes = 4096; // the system's limit
-constexpr int kEndSignals[] = {SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCPU};
-constexpr pid_t kFree = 0;
-constexpr pid_t kChanging = -1;
+constexpr uint32_t kFree = 0;
+constexpr uint32_t kChanging = UINT32_MAX;
 
 struct NameSlot
 {
-    std::atomic<pid_t> owner{kFree};
+    std::atomic<uint32_t> owner{kFree};
     char path[kPathBytes] = {};
 };
 
 NameSlot g_kSlots[16]; // a program writes only one or two files at a time
-
-void EndBySignal(int signal)
-{
-    const pid_t self = getpid();
-    for (const NameSlot& slot : g_kSlots)
-    {
-        if (slot.owner == self)
-            unlink(slot.path);
-    }
-    raise(signal); // SA_RESETHAND has restored the default action, which runs when this handler returns
-}
 
 } // namespace
 
@@ -46,11 +35,11 @@ int AddLiveName(const std::string& path)
         return -1;
     for (NameSlot& slot : g_kSlots)
     {
-        pid_t expected = kFree;
+        uint32_t expected = kFree;
         if (!slot.owner.compare_exchange_strong(expected, kChanging))
             continue;
         std::memcpy(slot.path, path.c_str(), path.size() + 1);
-        slot.owner = getpid();
+        slot.owner = ProcessNumber();
         return static_cast<int>(&slot - g_kSlots);
     }
     return -1;
@@ -62,19 +51,13 @@ void RemoveLiveName(int number)
         g_kSlots[number].owner = kFree;
 }
 
-void RemovePrivateFilesOnSignals()
+void RemoveLiveFiles()
 {
-    struct sigaction action = {};
-    action.sa_handler = EndBySignal;
-    action.sa_flags = SA_RESETHAND;
-    for (const int signal : kEndSignals)
-        sigaddset(&action.sa_mask, signal);
-    for (const int signal : kEndSignals)
+    const uint32_t self = ProcessNumber();
+    for (const NameSlot& slot : g_kSlots)
     {
-        struct sigaction before = {};
-        sigaction(signal, nullptr, &before);
-        if (before.sa_handler != SIG_IGN)
-            sigaction(signal, &action, nullptr);
+        if (slot.owner == self)
+            RemoveFile(slot.path);
     }
 }
 

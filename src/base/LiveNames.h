@@ -9,8 +9,11 @@ namespace gw {
 int AddLiveName(const std::string& path);
 /// Forgets the path with this number; negative numbers are ignored.
 void RemoveLiveName(int number);
-/// Makes the signals that end a process (SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCPU) delete the
-/// recorded files first. Signals that were ignored at process start stay ignored.
+/// Deletes the recorded files of this process. Signal handlers may call it.
+void RemoveLiveFiles();
+/// Makes the signals that end a process (SIGINT, SIGTERM, SIGHUP, SIGQUIT, SIGPIPE, SIGXCPU; on Windows what
+/// ends a console's programs) delete the recorded files first. Signals that were ignored at process start
+/// stay ignored.
 void RemovePrivateFilesOnSignals();
 
 } // namespace gw

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "PathSeparator.h"
+
 #include <cstdint>
 #include <string>
 #include <string_view>
@@ -14,13 +16,6 @@ struct PathParts
     std::string stem;      ///< file name without extension
     std::string extension; ///< from the last dot (included), or empty
 };
-
-inline constexpr char kPathSeparator =
-#ifdef _WIN32
-    '\\';
-#else
-    '/';
-#endif
 
 PathParts SplitPath(std::string_view path);
 /// Returns whether a path has this extension (dot included), ignoring case.
@@ -37,19 +32,22 @@ bool IsLink(const std::string& path);
 bool IsFolderItself(const std::string& path);
 /// Stores the size of a regular file in bytes; false if the file does not exist or cannot be examined.
 bool FileSize(const std::string& path, uint64_t& byteCount);
-/// Returns whether a file exists and is read-only: no write bit in its mode, or not writable by the user.
+/// Returns whether a file exists and is read-only: without a write bit in its mode, or with the read-only
+/// attribute; or not writable by the user. LastSystemError then has the reason.
 bool IsReadOnly(const std::string& path);
 /// Creates a folder and its parents; succeeds if it exists.
 bool CreateFolder(const std::string& path);
 bool DeleteFile(const std::string& path);
 
 /// Returns the folder of a path with its separator, or empty if the path has none. Unlike SplitPath, accepts
-/// only the platform's separator, as the system does.
+/// only the separators that the system does.
 std::string FolderOf(const std::string& path);
 /// Returns the names of a folder's regular files with this extension (dot included, case ignored), sorted by
 /// name so that runs are the same everywhere; empty if the folder cannot be read. Private files are skipped.
 std::vector<std::string> FilesInFolder(const std::string& folder, std::string_view extension);
 
+/// Returns the end of a chain of symbolic links, whether or not a file exists there. Empty for a cycle.
+std::string FollowLinks(const std::string& path);
 /// Resolves a relative path, with its "..", against a folder that contains no links.
 std::string PathFrom(const std::string& folder, const std::string& relative);
 /// Returns the system's folder for temporary files with a trailing separator; empty if it does not exist.

@@ -2,9 +2,9 @@
 // unpredictable, and a killed program leaves them behind. This file decides which of them are leftovers.
 //
 // A process id is not enough: a zombie still has one, and a container sees the ids of other containers as
-// free. Therefore the writer of a private file holds a lock on it (flock). The kernel drops that lock however
-// the program ends, and it works across the containers of one machine. A sweeper deletes only files that it
-// has locked itself.
+// free. Therefore the writer of a private file holds a lock on it (LockFile). The kernel drops that lock
+// however the program ends, and it works across the containers of one machine. A sweeper deletes only files
+// that it has locked itself.
 //
 // Between creating and locking a file, its owner can lose it to a sweeper. Then either the lock fails or the
 // file has lost its name. The owner notices both and tries another name. The sweeper, once it has the lock,
@@ -18,28 +18,17 @@
 
 #include "PrivateNames.h"
 
+#include "Files.h"
 #include "Paths.h"
+#include "Processes.h"
 
-#include <algorithm>
-#include <cerrno>
 #include <charconv>
 #include <cstdint>
 #include <cstdio>
 #include <ctime>
-#include <iterator>
 #include <limits>
-#include <memory>
 #include <mutex>
-#include <random>
 #include <set>
-
-#include <csignal>
-#include <dirent.h>
-#include <fcntl.h>
-#include <sys/file.h>
-#include <sys/stat.h>
-#include <sys/vfs.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -48,62 +37,29 @@ namespace {
 constexpr std::string_view kPrefix = ".gaitwright-";
 constexpr size_t kDigits = 8;
 constexpr size_t kPartBytes = kDigits + 1; // with the dash or dot that follows
-constexpr time_t kOldSeconds = 24 * 60 * 60;
+constexpr int64_t kOldSeconds = int64_t{24} * 60 * 60;
+constexpr int64_t kNanoseconds = 1'000'000'000;
 constexpr size_t kQuickEntries = 1000; // takes less than a millisecond to read
-
-// ext2 to ext4, XFS, Btrfs, F2FS, ZFS, bcachefs, tmpfs, ramfs, overlayfs.
-constexpr uint32_t kLocalSystems[] = {0xEF53,     0x58465342, 0x9123683E, 0xF2F52010, 0x2FC12FC1,
-                                      0xCA451A4E, 0x01021994, 0x858458F6, 0x794C7630};
-
-enum class ELock : uint8_t
-{
-    Held,
-    Taken, ///< another program holds it
-    None,  ///< the file system has no locks
-};
-
-ELock Lock(int file)
-{
-    if (flock(file, LOCK_EX | LOCK_NB) == 0)
-        return ELock::Held;
-    return errno == EWOULDBLOCK || errno == EINTR ? ELock::Taken : ELock::None;
-}
 
 bool IsStillNamed(int file, const std::string& path)
 {
-    struct stat open, named;
-    return fstat(file, &open) == 0 && lstat(path.c_str(), &named) == 0 && open.st_ino == named.st_ino &&
-           open.st_dev == named.st_dev;
+    FileStatus open, named;
+    return StatusOf(file, open) && StatusOfLink(path, named) && open.inode == named.inode &&
+           open.device == named.device;
 }
 
-bool IsOnLocalDisk(int file)
+uint32_t NumberOf(std::string_view text)
 {
-    struct statfs status;
-    return fstatfs(file, &status) == 0 &&
-           std::ranges::find(kLocalSystems, static_cast<uint32_t>(status.f_type)) != std::end(kLocalSystems);
-}
-
-uint32_t AddText(uint32_t number, const char* text)
-{
-    for (; *text; ++text)
-        number = (number ^ static_cast<unsigned char>(*text)) * 16777619u; // FNV-1a
+    uint32_t number = 2166136261u;
+    for (const char character : text)
+        number = (number ^ static_cast<unsigned char>(character)) * 16777619u; // FNV-1a
     return number;
-}
-
-uint32_t ReadMachineNumber()
-{
-    char name[256] = {};
-    gethostname(name, sizeof name - 1);
-    char processes[64] = {};
-    if (readlink("/proc/self/ns/pid", processes, sizeof processes - 1) < 0)
-        processes[0] = '\0';
-    return AddText(AddText(2166136261u, name), processes);
 }
 
 // Identifies the machine and its process namespace.
 uint32_t MachineNumber()
 {
-    static const uint32_t number = ReadMachineNumber();
+    static const uint32_t number = NumberOf(MachineName());
     return number;
 }
 
@@ -131,46 +87,40 @@ bool ReadParts(std::string_view name, NameParts& parts)
 
 bool IsGone(const NameParts& parts)
 {
-    return parts.machine == MachineNumber() && parts.program != 0 &&
-           kill(static_cast<pid_t>(parts.program), 0) != 0 && errno == ESRCH;
+    return parts.machine == MachineNumber() && IsProcessGone(parts.program);
 }
 
-bool IsDead(int file, const NameParts& parts, const struct stat& status)
+bool IsDead(int file, const NameParts& parts, const FileStatus& status)
 {
-    const ELock lock = Lock(file);
+    const ELock lock = LockFile(file);
     if (lock == ELock::Taken)
         return false;
     return (lock == ELock::Held && IsOnLocalDisk(file)) || IsGone(parts) ||
-           time(nullptr) - status.st_mtime > kOldSeconds;
+           std::time(nullptr) - status.modified / kNanoseconds > kOldSeconds;
 }
 
 void RemoveIfDead(const std::string& path, const NameParts& parts)
 {
-    struct stat status;
-    if (lstat(path.c_str(), &status) != 0 || !S_ISREG(status.st_mode))
+    FileStatus status;
+    if (!StatusOfLink(path, status) || status.kind != EFileKind::Regular)
         return;
-    // On network file systems, only a writable descriptor can hold such a lock.
-    const int file = open(path.c_str(), O_RDWR | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC);
+    const int file = OpenFile(path, EOpen::Existing);
     if (file < 0)
         return;
     if (IsDead(file, parts, status) && IsStillNamed(file, path))
-        unlink(path.c_str());
-    close(file);
+        RemoveFile(path.c_str());
+    CloseFile(file);
 }
 
 void Sweep(const std::string& folder, size_t entryLimit)
 {
-    const std::string place = folder.empty() ? "." : folder;
-    const std::unique_ptr<DIR, int (*)(DIR*)> directory(opendir(place.c_str()), closedir);
-    for (size_t i = 0; directory && i < entryLimit; ++i)
-    {
-        const dirent* const entry = readdir(directory.get());
-        if (!entry)
-            return;
+    size_t count = 0;
+    ListFolder(folder.empty() ? "." : folder, [&](const FolderEntry& entry) {
         NameParts parts;
-        if (ReadParts(entry->d_name, parts))
-            RemoveIfDead(WithSeparator(folder) + entry->d_name, parts);
-    }
+        if (count < entryLimit && ReadParts(entry.name, parts))
+            RemoveIfDead(WithSeparator(folder) + entry.name, parts);
+        return ++count < entryLimit;
+    });
 }
 
 // Returns whether neither this process nor its parent before the fork has swept the folder.
@@ -186,11 +136,8 @@ bool IsFirstSweep(const std::string& folder)
 
 std::string PrivateName(const std::string& folder, std::string_view extension)
 {
-    std::random_device random(
-        "getentropy"); // the default asks the processor, which is slow in virtual machines
     char parts[3 * kPartBytes + 1];
-    std::snprintf(parts, sizeof parts, "%08x-%08x-%08x", MachineNumber(), static_cast<uint32_t>(getpid()),
-                  random());
+    std::snprintf(parts, sizeof parts, "%08x-%08x-%08x", MachineNumber(), ProcessNumber(), RandomNumber());
     return folder + std::string(kPrefix) + parts + std::string(extension);
 }
 
@@ -201,8 +148,8 @@ bool IsPrivateName(std::string_view name)
 
 bool LockNewFile(int file)
 {
-    struct stat status;
-    return Lock(file) != ELock::Taken && fstat(file, &status) == 0 && status.st_nlink > 0;
+    FileStatus status;
+    return LockFile(file) != ELock::Taken && StatusOf(file, status) && status.linkCount > 0;
 }
 
 void RemoveLeftovers(const std::string& folder)

@@ -1,20 +1,18 @@
 #include "SystemError.h"
 
-#include <cerrno>
-#include <system_error>
 #include <utility>
 
 namespace gw {
 
 namespace {
 
-thread_local int t_iKept = 0; // like errno
+thread_local int t_iKept = 0; // like the system's own code
 
 } // namespace
 
 void KeepSystemError()
 {
-    t_iKept = errno;
+    t_iKept = LastSystemError();
 }
 
 void KeepSystemError(int code)
@@ -30,11 +28,6 @@ void ForgetSystemError()
 int TakeSystemError()
 {
     return std::exchange(t_iKept, 0);
-}
-
-std::string SystemErrorWords(int code)
-{
-    return code == 0 ? std::string() : ": " + std::generic_category().message(code);
 }
 
 std::string TakeSystemErrorWords()

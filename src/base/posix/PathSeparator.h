@@ -1,0 +1,9 @@
+#pragma once
+
+namespace gw {
+
+/// What joins the parts of a path, and all characters that separate them for the system.
+inline constexpr char kPathSeparator = '/';
+inline constexpr const char* kSystemSeparators = "/";
+
+} // namespace gw
