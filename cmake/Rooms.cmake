@@ -1,3 +1,5 @@
+list(APPEND CMAKE_MODULE_PATH ${PROJECT_SOURCE_DIR}/cmake)
+
 # Every folder is one target, created by these functions. A target sees only the headers of its own folder and of the
 # targets that it names.
 
@@ -14,14 +16,17 @@ set(GAITWRIGHT_HARDENING_INNER ${GAITWRIGHT_HARDENING} -fstack-protector)
 set(GAITWRIGHT_HARDENING_OUTER ${GAITWRIGHT_HARDENING} -fstack-protector-strong -D_GLIBCXX_ASSERTIONS)
 
 function(gw_harden target)
+  if(WIN32)
+    # The other checks need a library of this compiler, which costs more than they do.
+    target_compile_options(${target} PRIVATE "$<$<CONFIG:Release>:-D_GLIBCXX_ASSERTIONS>")
+    return()
+  endif()
   set(hardening ${GAITWRIGHT_HARDENING_OUTER})
   if(target IN_LIST GAITWRIGHT_INNER_ROOMS)
     set(hardening ${GAITWRIGHT_HARDENING_INNER})
   endif()
   target_compile_options(${target} PRIVATE "$<$<CONFIG:Release>:${hardening}>")
-  if(NOT WIN32)
-    target_link_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wl,-z,relro,-z,now>")
-  endif()
+  target_link_options(${target} PRIVATE "$<$<CONFIG:Release>:-Wl,-z,relro,-z,now>")
 endfunction()
 
 # Compile options that every target of the project shares.
@@ -70,6 +75,7 @@ endfunction()
 set(GAITWRIGHT_SYSTEM posix)
 if(WIN32)
   set(GAITWRIGHT_SYSTEM windows)
+  list(PREPEND CMAKE_MODULE_PATH ${PROJECT_SOURCE_DIR}/cmake/windows)
 endif()
 
 # gw_room(NAME [PUBLIC targets...] [PRIVATE targets...]): a library of all sources in the current folder, and in the one

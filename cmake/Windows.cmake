@@ -6,7 +6,7 @@ set(CMAKE_RC_COMPILER x86_64-w64-mingw32-windres)
 find_program(GAITWRIGHT_WINE NAMES wine64 wine PATHS /usr/lib/wine NO_CMAKE_FIND_ROOT_PATH)
 set(CMAKE_CROSSCOMPILING_EMULATOR ${GAITWRIGHT_WINE})
 
-# Libraries are the compiler's own. cmake/WindowsHeaders.cmake adds the libraries that are headers only.
+# Libraries are the compiler's own. The modules in cmake/windows find those that are headers only, or sources.
 set(CMAKE_FIND_ROOT_PATH /usr/x86_64-w64-mingw32)
 set(CMAKE_FIND_ROOT_PATH_MODE_PROGRAM NEVER)
 set(CMAKE_FIND_ROOT_PATH_MODE_LIBRARY ONLY)
@@ -17,3 +17,7 @@ set(CMAKE_FIND_ROOT_PATH_MODE_PACKAGE ONLY)
 set(CMAKE_EXE_LINKER_FLAGS_INIT -static)
 set(CMAKE_SHARED_LINKER_FLAGS_INIT -static)
 set(CMAKE_MODULE_LINKER_FLAGS_INIT -static)
+
+# Windows 10 is the oldest that is supported. Texts are wide, and sizes of files have 64 bits.
+add_compile_definitions(_WIN32_WINNT=0x0A00 UNICODE _UNICODE _FILE_OFFSET_BITS=64
+                        __USE_MINGW_ANSI_STDIO=1)

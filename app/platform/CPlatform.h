@@ -8,6 +8,13 @@ namespace gw {
 /// The target skeleton, in the data folder.
 inline constexpr const char* kTargetFile = "base.htr";
 
+/// Whether a platform may write anything.
+enum class EPlatformWriting
+{
+    No,  ///< settings are not stored and folders not created
+    Yes, ///< as in a desktop program
+};
+
 /// What the program needs from the operating system: settings, folders, language. Paths are UTF-8.
 class CPlatform
 {
@@ -37,6 +44,10 @@ public:
 /// Returns the folder of the user's own profiles with a trailing separator: in the host product's folder of
 /// custom data, whose key path is given, or in the user's documents if the product is not installed.
 std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath);
+
+/// Returns the folder of the program's data with a trailing separator: next to the executable, as in a build. An
+/// installation keeps files that are the same on all machines in a separate folder.
+std::string InstalledDataFolder();
 
 /// Returns the primary language of a locale number.
 constexpr uint32_t PrimaryLanguage(uint32_t locale)

@@ -1,12 +1,11 @@
 #pragma once
 
-#include <csignal>
-#include <iterator>
+#include <memory>
 
 namespace gw {
 
-/// While it exists, requests to end (Ctrl-C, SIGTERM, hang-up) do not end the program but are counted.
-/// Signals that were ignored at program start stay ignored.
+/// While it exists, requests to end (Ctrl-C, SIGTERM, hang-up, a closed console) do not end the program but are
+/// counted. Requests that were ignored at program start stay ignored.
 class CInterrupt
 {
 public:
@@ -21,8 +20,8 @@ public:
     static void Ignore();
 
 private:
-    static constexpr int kSignals[] = {SIGINT, SIGTERM, SIGHUP};
-    struct sigaction m_kBefore[std::size(kSignals)] = {};
+    struct Before;
+    std::unique_ptr<Before> m_spBefore; ///< what a request did before
 };
 
 } // namespace gw

@@ -13,13 +13,13 @@ struct JobEnd
     enum class EKind : uint8_t
     {
         Ran,      ///< finished; `answer` is its result
-        Died,     ///< its process died; `status` is from waitpid
+        Died,     ///< its process died; `cause` says how
         TimedOut, ///< its process was killed because the job took too long
     };
 
     EKind kind = EKind::Ran;
     uint8_t answer = 0;
-    int status = 0;
+    std::string cause; ///< such as "Segmentation fault"
     double seconds = 0.0; ///< time spent working, without waiting for its turn
     std::string output;   ///< standard output
     std::string words;    ///< standard error
@@ -32,9 +32,12 @@ class CJobHandler
 public:
     virtual ~CJobHandler() = default;
 
-    /// Does a job. Runs in a worker process, a copy of the program at the time it was started, so changes in
-    /// memory stay there. Returns a number of the handler's choice.
+    /// Does a job. Runs in a worker process, so changes in memory stay there. Where the system can, the process is a
+    /// copy of the program at the time it was started; elsewhere, its handler was made from Description. Returns a
+    /// number of the handler's choice.
     virtual uint8_t Run(size_t job, std::FILE* record) = 0;
+    /// Returns a text from which the program can make the same handler in another process.
+    virtual std::string Description() const = 0;
     /// Called before a job's result, complete under a private path, takes its place. Runs in the worker.
     virtual void Ready(size_t, const std::string&) {}
     /// Called immediately when a job's process has ended; nobody is working on it any more.

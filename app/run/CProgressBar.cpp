@@ -3,14 +3,13 @@
 
 #include "CProgressBar.h"
 
+#include "Terminal.h"
+
 #include <algorithm>
 #include <array>
 #include <charconv>
 #include <cmath>
 #include <cstdio>
-
-#include <sys/ioctl.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -21,7 +20,6 @@ using namespace std::chrono_literals;
 constexpr auto kPeriod = 100ms;
 constexpr auto kMemory = 15s; // long enough for a steady rate, short enough to follow changes
 constexpr size_t kBarWidth = 24;
-constexpr size_t kUsualWidth = 80;
 
 std::string OneDecimal(double value)
 {
@@ -59,17 +57,6 @@ void Write(const std::string& text)
 
 } // namespace
 
-size_t TerminalWidth()
-{
-    return TerminalWidth(STDERR_FILENO);
-}
-
-size_t TerminalWidth(int stream)
-{
-    winsize size = {};
-    return ioctl(stream, TIOCGWINSZ, &size) == 0 && size.ws_col > 0 ? size.ws_col : kUsualWidth;
-}
-
 std::string ProgressLine(const RunProgress& progress, size_t width)
 {
     const size_t left = progress.total - std::min(progress.done, progress.total);
@@ -84,7 +71,7 @@ std::string ProgressLine(const RunProgress& progress, size_t width)
 }
 
 CProgressBar::CProgressBar(size_t total, bool wanted)
-    : m_uiTotal(total), m_bShown(wanted && isatty(STDERR_FILENO) != 0)
+    : m_uiTotal(total), m_bShown(wanted && IsTerminal(stderr))
 {
 }
 
@@ -97,7 +84,7 @@ void CProgressBar::Show(size_t done, size_t failed)
     m_bOnScreen = true;
     // One column stays free, because a full line would wrap.
     const RunProgress progress{done, m_uiTotal, failed, Rate({now, done})};
-    Write("\r\x1b[K" + ProgressLine(progress, TerminalWidth() - 1));
+    Write("\r\x1b[K" + ProgressLine(progress, TerminalWidth(stderr) - 1));
 }
 
 double CProgressBar::Rate(const Sample& now)

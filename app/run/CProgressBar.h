@@ -19,11 +19,6 @@ struct RunProgress
 /// Returns "[=====>    ] 512/1000  48.2/s  10s left, 3 failed", cut to a width in characters.
 std::string ProgressLine(const RunProgress& progress, size_t width);
 
-/// Returns the width in characters of the terminal of standard error; 80 if it is unknown.
-size_t TerminalWidth();
-/// Same for the terminal behind another stream.
-size_t TerminalWidth(int stream);
-
 /// A progress line on the terminal of standard error. Without a terminal, nothing is shown.
 class CProgressBar
 {

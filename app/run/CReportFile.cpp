@@ -1,14 +1,11 @@
 #include "CReportFile.h"
 
 #include "CMappedFile.h"
+#include "Files.h"
 #include "SystemError.h"
 #include "Text.h"
 
-#include <cerrno>
 #include <utility>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -27,43 +24,29 @@ bool CReportFile::IsReport(const std::string& path)
 CReportFile::~CReportFile()
 {
     if (m_iFile >= 0)
-        close(m_iFile);
+        CloseFile(m_iFile);
 }
 
 bool CReportFile::Open(const std::string& path, EStart start)
 {
     if (m_iFile >= 0)
-        close(std::exchange(m_iFile, -1));
-    // Readable too, to check how the file ends.
-    const int cut = start == EStart::Empty ? O_TRUNC : 0;
-    m_iFile = open(path.c_str(), O_RDWR | O_CREAT | O_APPEND | O_CLOEXEC | cut, 0666);
+        CloseFile(std::exchange(m_iFile, -1));
+    m_iFile = OpenFile(path, start == EStart::Empty ? EOpen::AppendAnew : EOpen::Append);
     m_bFailed = m_iFile < 0;
     if (m_bFailed)
         KeepSystemError();
-    return !m_bFailed && (!HasOpenLine() || AddLine({}));
+    return !m_bFailed && (start == EStart::Empty || !HasOpenLine(path) || AddLine({}));
 }
 
-bool CReportFile::HasOpenLine() const
+bool CReportFile::HasOpenLine(const std::string& path)
 {
-    const off_t size = lseek(m_iFile, 0, SEEK_END);
-    char last = '\n';
-    return size > 0 && pread(m_iFile, &last, 1, size - 1) == 1 && last != '\n';
+    CMappedFile file;
+    return file.Open(path) == EFailure::None && !file.Text().empty() && !file.Text().ends_with('\n');
 }
 
 bool CReportFile::AddLine(std::string_view line)
 {
-    const std::string text = std::string(line) + '\n';
-    for (std::string_view rest = text; !m_bFailed && !rest.empty();)
-    {
-        const ssize_t count = write(m_iFile, rest.data(), rest.size());
-        if (count > 0)
-            rest.remove_prefix(static_cast<size_t>(count));
-        else if (errno != EINTR)
-        {
-            KeepSystemError();
-            m_bFailed = true;
-        }
-    }
+    m_bFailed = m_bFailed || !WriteAll(m_iFile, std::string(line) + '\n');
     return !m_bFailed;
 }
 

@@ -32,7 +32,7 @@ public:
     bool AddLine(std::string_view line);
 
 private:
-    bool HasOpenLine() const;
+    static bool HasOpenLine(const std::string& path);
 
     int m_iFile = -1;
     bool m_bFailed = false;

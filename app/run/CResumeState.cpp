@@ -5,13 +5,12 @@
 
 #include "CJsonMembers.h"
 #include "CMappedFile.h"
+#include "Files.h"
 #include "JsonText.h"
 #include "Paths.h"
 #include "Text.h"
 
 #include <algorithm>
-
-#include <sys/stat.h>
 
 namespace gw {
 
@@ -125,10 +124,11 @@ bool CResumeState::AddSynced()
 
 std::string ModificationDigits(const std::string& path)
 {
-    struct stat status = {};
-    if (stat(path.c_str(), &status) != 0)
+    constexpr int64_t kSecond = 1'000'000'000;
+    FileStatus status;
+    if (!StatusOf(path, status))
         return {};
-    return std::to_string(status.st_mtim.tv_sec) + '.' + std::to_string(status.st_mtim.tv_nsec);
+    return std::to_string(status.modified / kSecond) + '.' + std::to_string(status.modified % kSecond);
 }
 
 } // namespace gw

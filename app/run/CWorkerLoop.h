@@ -1,6 +1,7 @@
 #pragma once
 
 #include "CJobHandler.h"
+#include "CWorkerLink.h"
 
 #include <chrono>
 
@@ -14,11 +15,11 @@ enum class ECommit : uint8_t
     InTurn,
 };
 
-/// The worker's side of the pool: does the jobs it receives until its socket is closed.
+/// The worker's side of the pool: does the jobs it receives until its connection is closed.
 class CWorkerLoop
 {
 public:
-    CWorkerLoop(CJobHandler& handler, int socket, std::FILE* record, ECommit commit);
+    CWorkerLoop(CJobHandler& handler, const CWorkerLink& link, std::FILE* record, ECommit commit);
     void Run();
 
 private:
@@ -28,7 +29,7 @@ private:
     bool AskToCommit();
 
     CJobHandler& handler_;
-    int m_iSocket;
+    CWorkerLink m_kLink;
     std::FILE* m_pkRecord;
     ECommit m_eCommit;
     size_t m_uiJob = 0;

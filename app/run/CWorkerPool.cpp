@@ -16,8 +16,6 @@
 #include <algorithm>
 #include <utility>
 
-#include <poll.h>
-
 namespace gw {
 
 namespace {
@@ -25,7 +23,7 @@ namespace {
 using EState = CWorkerProcess::EState;
 
 constexpr size_t kAhead = 4;               // processes per active one, including those that wait
-constexpr int kTickMilliseconds = 100;     // maximum time between ticks
+constexpr std::chrono::milliseconds kTick(100); // maximum time between ticks
 constexpr std::chrono::seconds kGrace(10); // for running jobs when the run must end
 
 } // namespace
@@ -48,7 +46,7 @@ bool CWorkerPool::Run(size_t jobCount, const CInterrupt& interrupt)
         OpenGate();
         if (CountIn(EState::Running) == 0)
             break;
-        Wait();
+        CWorkerProcess::WaitForAny(m_kWorkers, kTick);
         ReceiveAll();
         if (ending_ && (interrupt.Count() > 1 || Clock::now() - *ending_ > kGrace))
             AbandonRunning();
@@ -79,10 +77,7 @@ CWorkerProcess* CWorkerPool::StartWorker()
     const size_t limit = m_kSettings.workerCount * (m_kSettings.commit == ECommit::InTurn ? kAhead : 1);
     if (m_kWorkers.size() >= limit)
         return nullptr;
-    std::vector<int> sockets;
-    for (const auto& worker : m_kWorkers)
-        sockets.push_back(worker->Socket());
-    std::unique_ptr<CWorkerProcess> worker = CWorkerProcess::Start(handler_, m_kSettings.commit, sockets);
+    std::unique_ptr<CWorkerProcess> worker = CWorkerProcess::Start(handler_, m_kSettings.commit, m_kWorkers);
     return worker ? m_kWorkers.emplace_back(std::move(worker)).get() : nullptr;
 }
 
@@ -107,14 +102,6 @@ void CWorkerPool::OpenGate()
         if (!m_bRefused && worker->State() == EState::Waiting && worker->Job() == m_uiTaken)
             worker->LetCommit();
     }
-}
-
-void CWorkerPool::Wait() const
-{
-    std::vector<pollfd> sockets;
-    for (const auto& worker : m_kWorkers)
-        sockets.push_back({worker->Socket(), POLLIN, 0});
-    poll(sockets.data(), sockets.size(), kTickMilliseconds);
 }
 
 void CWorkerPool::ReceiveAll()

@@ -41,7 +41,6 @@ private:
     CWorkerProcess* StartWorker();
     void GiveJobs(size_t jobCount);
     void OpenGate();
-    void Wait() const;
     void ReceiveAll();
     void KillLate();
     void AbandonRunning();

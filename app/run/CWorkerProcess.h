@@ -2,17 +2,17 @@
 
 #include "CWorkerLoop.h"
 
+#include <chrono>
 #include <memory>
 #include <span>
-
-#include <sys/types.h>
+#include <vector>
 
 namespace gw {
 
-struct WorkerReply;
+class CWorkerChild;
 
-/// A worker process, seen from the program. Its output goes to files in memory that outlive it, so the last
-/// output of a process that died is reported too.
+/// A worker process, seen from the program. Its output goes to files that outlive it, so the last output of a
+/// process that died is reported too.
 class CWorkerProcess
 {
 public:
@@ -24,19 +24,20 @@ public:
         Gone,
     };
 
-    /// Starts a process. Closes the sockets of the other workers in it; otherwise they would not notice the
-    /// end of the program. Returns null if the system cannot start one.
+    /// Starts a process next to others. Returns null if the system cannot start one.
     static std::unique_ptr<CWorkerProcess> Start(CJobHandler& handler, ECommit commit,
-                                                 std::span<const int> otherSockets);
-    /// Waits for the process, which ends when its socket is closed; kills it if that takes more than some
-    /// seconds.
+                                                 std::span<const std::unique_ptr<CWorkerProcess>> others);
+    /// Waits for the process, which ends when it is closed; kills it if that takes more than some seconds.
     ~CWorkerProcess();
     CWorkerProcess(const CWorkerProcess&) = delete;
     CWorkerProcess& operator=(const CWorkerProcess&) = delete;
 
+    /// Waits until one of the processes has something to receive, at most for some time.
+    static void WaitForAny(std::span<const std::unique_ptr<CWorkerProcess>> workers,
+                           std::chrono::milliseconds limit);
+
     EState State() const { return m_eState; }
     size_t Job() const { return m_uiJob; }
-    int Socket() const { return m_iSocket; }
     /// Returns the seconds since it got its job or its turn.
     double RunningSeconds() const;
 
@@ -51,20 +52,15 @@ public:
     void Close();
 
 private:
-    CWorkerProcess() = default;
-    bool Open();
-    [[noreturn]] void Serve(CJobHandler& handler, ECommit commit, int socket);
+    CWorkerProcess();
+    static std::vector<CWorkerChild*> ChildrenOf(std::span<const std::unique_ptr<CWorkerProcess>> workers);
     void Send(size_t job);
     void Bury(JobEnd& end);
     void Drain(JobEnd& end);
 
     using Clock = std::chrono::steady_clock;
 
-    pid_t m_iProcess = -1;
-    int m_iSocket = -1;
-    int m_iOutput = -1;
-    int m_iWords = -1;
-    int m_iRecord = -1;
+    std::unique_ptr<CWorkerChild> m_spChild;
     size_t m_uiJob = 0;
     EState m_eState = EState::Idle;
     Clock::time_point m_kSince;

@@ -3,6 +3,8 @@
 
 #include "SourceTree.h"
 
+#include "Files.h"
+#include "NativePath.h"
 #include "Paths.h"
 
 #include <algorithm>
@@ -11,22 +13,20 @@
 #include <system_error>
 #include <utility>
 
-#include <sys/stat.h>
-
 namespace fs = std::filesystem;
 
 namespace gw {
 
 namespace {
 
-using Identity = std::pair<dev_t, ino_t>;
+using Identity = std::pair<uint64_t, uint64_t>; // device, inode
 
 bool Identify(const std::string& path, Identity& identity)
 {
-    struct stat status = {};
-    if (stat(path.c_str(), &status) != 0)
+    FileStatus status;
+    if (!StatusOf(path, status))
         return false;
-    identity = {status.st_dev, status.st_ino};
+    identity = {status.device, status.inode};
     return true;
 }
 
@@ -37,7 +37,7 @@ public:
         : m_kFolder(WithSeparator(folder)), m_kExtensions(extensions)
     {
         std::error_code error;
-        m_kRealRoot = fs::canonical(folder, error);
+        m_kRealRoot = fs::canonical(NativePath(folder), error);
         LeaveOut(folder);
     }
 
@@ -75,7 +75,7 @@ void CWalk::Take(const std::string& below)
     m_kFiles.assign(m_kExtensions.size(), {});
     m_kDead.clear();
     std::error_code error;
-    fs::directory_iterator entry(m_kFolder + below, error);
+    fs::directory_iterator entry(NativePath(m_kFolder + below), error);
     for (; !error && entry != fs::directory_iterator(); entry.increment(error))
         TakeEntry(*entry);
     if (error)
@@ -103,7 +103,7 @@ void CWalk::Take(const std::string& below)
 void CWalk::TakeEntry(const fs::directory_entry& entry)
 {
     std::error_code error;
-    const std::string name = entry.path().filename().string();
+    const std::string name = PathText(entry.path().filename());
     if (name.starts_with('.'))
         return;
     if (entry.is_directory(error))

@@ -4,7 +4,7 @@
 
 namespace gw {
 
-/// Sent to a worker: do this job or, if the worker has asked, replace its file. A closed socket means no, and
+/// Sent to a worker: do this job or, if the worker has asked, replace its file. A closed connection means no, and
 /// no further jobs.
 struct WorkerOrder
 {

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CConversion.h"
-#include "CFilePlatform.h"
+#include "CSystemPlatform.h"
 #include "CMotionFile.h"
 #include "CRetargeter.h"
 #include "CSourceMotion.h"
@@ -92,7 +92,7 @@ private:
     void WarnOfNumbers() const;
     void TellMessage(int id) const;
 
-    CFilePlatform platform_;
+    CSystemPlatform platform_;
     ConversionChoices choices_;
     NoticeListener notify_;
     std::string sourcePath_;

@@ -60,7 +60,7 @@ CPerson::~CPerson()
 
 void CPerson::Start()
 {
-    m_spPlatform = std::make_unique<CFilePlatform>(EPlatformWriting::Yes);
+    m_spPlatform = std::make_unique<CSystemPlatform>(EPlatformWriting::Yes);
     m_spFrame = std::make_unique<CGaitConvertFrame>(m_kSkin, m_kKeys, *m_spPlatform);
     m_spFrame->show();
     Activate(*m_spFrame);

@@ -1,7 +1,7 @@
 #pragma once
 
 #include "CDialogAnswers.h"
-#include "CFilePlatform.h"
+#include "CSystemPlatform.h"
 #include "CGaitConvertContent.h"
 #include "CGaitConvertFrame.h"
 #include "CLeftKeys.h"
@@ -79,7 +79,7 @@ private:
     void Start();
 
     CTempHome m_kHome;
-    std::unique_ptr<CFilePlatform> m_spPlatform;
+    std::unique_ptr<CSystemPlatform> m_spPlatform;
     std::set<EKey> m_kHeld; // on the keyboard, whichever window has the focus
     CLeftKeys m_kKeys{[this] { return m_kHeld; }};
     CSkin m_kSkin;

@@ -7,7 +7,7 @@
 #include "CFileRun.h"
 
 #include "CContentHash.h"
-#include "CFilePlatform.h"
+#include "CSystemPlatform.h"
 #include "CSafeFile.h"
 #include "CTextFile.h"
 #include "CWorkerPool.h"
@@ -118,7 +118,7 @@ std::optional<Notice> CFileRun::WhyNotReport() const
 
 bool CFileRun::OpenState()
 {
-    const CFilePlatform platform(EPlatformWriting::No, options_.dataFolder);
+    const CSystemPlatform platform(EPlatformWriting::No, options_.dataFolder);
     CContentHash key;
     constexpr uint64_t kHowToTell = kCheck | kHtml; // figures are stored in any case
     key.AddText(GAITWRIGHT_VERSION)

@@ -3,7 +3,7 @@
 
 #include "RunDesktop.h"
 
-#include "CFilePlatform.h"
+#include "CSystemPlatform.h"
 #include "CGaitConvertFrame.h"
 #include "CInstanceCounter.h"
 #include "CInstanceServer.h"
@@ -130,7 +130,7 @@ int RunTool(CPlatform& platform, const CLeftKeys& keys)
 
 int InitInstance(const DesktopArguments& arguments)
 {
-    CFilePlatform platform(EPlatformWriting::Yes);
+    CSystemPlatform platform(EPlatformWriting::Yes);
     const CLeftKeys keys;
     return arguments.mapTool ? RunTool(platform, keys) : InitMain(arguments.file, platform, keys);
 }

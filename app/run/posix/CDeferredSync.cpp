@@ -22,29 +22,29 @@ bool SyncOne(int file)
 
 CDeferredSync::~CDeferredSync()
 {
-    for (const auto& [device, system] : m_kOpen)
+    for (const auto& [device, place] : m_kPlaces)
     {
-        if (system.file >= 0)
-            close(system.file);
+        if (place.file >= 0)
+            close(place.file);
     }
 }
 
 void CDeferredSync::Add(const std::string& path)
 {
     struct stat status = {};
-    if (stat(path.c_str(), &status) == 0 && !m_kOpen.contains(status.st_dev))
-        m_kOpen[status.st_dev] = {path, open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)};
+    if (stat(path.c_str(), &status) == 0 && !m_kPlaces.contains(status.st_dev))
+        m_kPlaces[status.st_dev] = {path, open(path.c_str(), O_RDONLY | O_CLOEXEC | O_NONBLOCK)};
 }
 
 std::string CDeferredSync::Sync() const
 {
     std::string failed;
-    for (const auto& [device, system] : m_kOpen)
+    for (const auto& [device, place] : m_kPlaces)
     {
-        if (SyncOne(system.file))
+        if (SyncOne(place.file))
             continue;
         KeepSystemError();
-        failed = system.path;
+        failed = place.path;
     }
     return failed;
 }

@@ -1,10 +1,13 @@
 #include "CInterrupt.h"
 
+#include <csignal>
 #include <iterator>
 
 namespace gw {
 
 namespace {
+
+constexpr int kSignals[] = {SIGINT, SIGTERM, SIGHUP};
 
 // The only thing a handler may touch.
 volatile std::sig_atomic_t requests = 0;
@@ -16,15 +19,21 @@ void TakeRequest(int)
 
 } // namespace
 
-CInterrupt::CInterrupt()
+struct CInterrupt::Before
+{
+    struct sigaction actions[std::size(kSignals)] = {};
+};
+
+CInterrupt::CInterrupt() : m_spBefore(std::make_unique<Before>())
 {
     requests = 0;
     struct sigaction action = {};
     action.sa_handler = TakeRequest; // without SA_RESTART, so that waits return immediately
     for (size_t i = 0; i < std::size(kSignals); ++i)
     {
-        sigaction(kSignals[i], nullptr, &m_kBefore[i]);
-        if (m_kBefore[i].sa_handler != SIG_IGN)
+        struct sigaction& before = m_spBefore->actions[i];
+        sigaction(kSignals[i], nullptr, &before);
+        if (before.sa_handler != SIG_IGN)
             sigaction(kSignals[i], &action, nullptr);
     }
 }
@@ -32,7 +41,7 @@ CInterrupt::CInterrupt()
 CInterrupt::~CInterrupt()
 {
     for (size_t i = 0; i < std::size(kSignals); ++i)
-        sigaction(kSignals[i], &m_kBefore[i], nullptr);
+        sigaction(kSignals[i], &m_spBefore->actions[i], nullptr);
 }
 
 int CInterrupt::Count() const

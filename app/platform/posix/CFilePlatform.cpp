@@ -21,21 +21,11 @@ constexpr std::string_view kMaker = "Tessarine";
 constexpr std::string_view kProgramFile = "Tessarine/Gaitwright.conf";
 constexpr std::string_view kMakerFile = "Tessarine.conf"; // shared by all programs of the maker
 constexpr std::string_view kSection = "Settings";
-constexpr const char* kSharedFolder = GAITWRIGHT_SHARED_FROM_PROGRAMS; // in installations
 
 std::string Environment(const char* name)
 {
     const char* value = std::getenv(name);
     return value ? value : "";
-}
-
-// Next to the executable, as in a build. An installation keeps machine-independent files in a separate
-// folder.
-std::string OwnDataFolder()
-{
-    std::string beside = ExecutableFolder();
-    std::string shared = PathFrom(beside, kSharedFolder);
-    return !FileExists(beside + kTargetFile) && FolderExists(shared) ? shared : beside;
 }
 
 // Returns an environment variable that holds an absolute path; relative paths are ignored.
@@ -99,17 +89,9 @@ bool SplitKeyPath(const std::string& keyPath, std::string& product, std::string&
 
 } // namespace
 
-std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath)
-{
-    std::string folder = platform.ReadHostKey(keyPath, "Custom Data");
-    if (folder.empty())
-        folder = platform.DocumentsFolder();
-    return WithSeparator(WithSeparator(std::move(folder)) + "BVH Profile");
-}
-
 CFilePlatform::CFilePlatform(EPlatformWriting writing, std::string dataFolder)
     : m_bWriting(writing == EPlatformWriting::Yes),
-      m_kDataFolder(WithSeparator(dataFolder.empty() ? OwnDataFolder() : std::move(dataFolder))),
+      m_kDataFolder(WithSeparator(dataFolder.empty() ? InstalledDataFolder() : std::move(dataFolder))),
       m_kHome(AbsolutePath("HOME", "/")),
       m_kUserFolder(WithSeparator(AbsolutePath("XDG_CONFIG_HOME", WithSeparator(m_kHome) + ".config"))),
       m_kSystemFolders(SplitList(Environment("XDG_CONFIG_DIRS")))

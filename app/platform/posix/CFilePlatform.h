@@ -7,13 +7,6 @@
 
 namespace gw {
 
-/// Whether a platform may write anything.
-enum class EPlatformWriting
-{
-    No,  ///< settings are not stored and folders not created
-    Yes, ///< as in a desktop program
-};
-
 /// The platform for systems with freedesktop folders, using plain files and no toolkit: settings in
 /// Tessarine/Gaitwright.conf of the configuration folders, the host product's keys in Tessarine/PRODUCT.conf
 /// of the system's folders. The environment is read once, by the constructor.
