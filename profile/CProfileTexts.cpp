@@ -1,17 +1,13 @@
 #include "CProfileTexts.h"
 
+#include "CFolderFiles.h"
 #include "Numbers.h"
 #include "Paths.h"
 #include "ProfileFile.h"
 #include "Text.h"
 
 #include <algorithm>
-#include <tuple>
 #include <unordered_map>
-
-#include <fcntl.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -19,7 +15,7 @@ namespace {
 
 // A thousand profiles. A file of this size is read, not mapped, so it can be replaced while its texts are
 // used.
-constexpr off_t kPackByteLimit = off_t{1} << 20;
+constexpr uint64_t kPackByteLimit = uint64_t{1} << 20;
 
 using PackedTexts = std::unordered_map<std::string_view, std::string_view>;
 
@@ -41,47 +37,16 @@ PackedTexts ReadPack(std::string_view rest)
     return texts;
 }
 
-// A folder's files by their names. The system then resolves the folder's path once, not for every file.
-class CFolder
-{
-public:
-    explicit CFolder(const std::string& folder)
-        : file_(open(folder.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC))
-    {
-    }
-    ~CFolder()
-    {
-        if (file_ >= 0)
-            close(file_);
-    }
-    CFolder(const CFolder&) = delete;
-    CFolder& operator=(const CFolder&) = delete;
-
-    bool StatusOf(const char* name, struct stat& status) const
-    {
-        return file_ >= 0 && fstatat(file_, name, &status, 0) == 0;
-    }
-
-private:
-    int file_;
-};
-
-// A copied installation can have times truncated to seconds, equally for all its files.
-bool IsNewer(const struct stat& a, const struct stat& b)
-{
-    return std::tuple(a.st_mtim.tv_sec, a.st_mtim.tv_nsec) > std::tuple(b.st_mtim.tv_sec, b.st_mtim.tv_nsec);
-}
-
 } // namespace
 
 CProfileTexts::CProfileTexts(const std::string& folder, EPack pack)
 {
     // The time is read before the content: a pack that is replaced in between then counts as old.
-    const CFolder files(folder);
-    struct stat packStatus;
+    const CFolderFiles files(folder);
+    FileStatus packStatus;
     PackedTexts packed;
     if (pack == EPack::Used && files.StatusOf(std::string(kProfilePack).c_str(), packStatus) &&
-        packStatus.st_size <= kPackByteLimit &&
+        packStatus.byteCount <= kPackByteLimit &&
         m_kPack.Open(folder + std::string(kProfilePack)) == EFailure::None)
         packed = ReadPack(m_kPack.Text());
     const std::vector<std::string> names = FilesInFolder(folder, ".prf");
@@ -89,10 +54,11 @@ CProfileTexts::CProfileTexts(const std::string& folder, EPack pack)
     for (const std::string& file : names)
     {
         const auto found = packed.find(file);
-        struct stat status;
+        FileStatus status;
+        // A copied installation can have times truncated to seconds, equally for all its files.
         const bool isPacked = found != packed.end() && files.StatusOf(file.c_str(), status) &&
-                              static_cast<uint64_t>(status.st_size) == found->second.size() &&
-                              !IsNewer(status, packStatus);
+                              status.byteCount == found->second.size() &&
+                              status.modified <= packStatus.modified;
         Add(folder, file, isPacked ? std::optional(found->second) : std::nullopt);
     }
 }

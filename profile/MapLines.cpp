@@ -5,6 +5,7 @@
 #include "CSafeFile.h"
 #include "Numbers.h"
 #include "ProfileFile.h"
+#include "SystemConventions.h"
 #include "Text.h"
 
 namespace gw {

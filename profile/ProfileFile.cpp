@@ -7,6 +7,7 @@
 #include "CMapRowTable.h"
 #include "CMappedFile.h"
 #include "Numbers.h"
+#include "SystemConventions.h"
 #include "Text.h"
 
 #include <algorithm>

@@ -19,14 +19,6 @@ inline constexpr std::string_view kFixedSource = "[FIXED]";
 /// The maximum size of a profile; a full skeleton takes a fiftieth of it.
 inline constexpr size_t kProfileByteLimit = 262'144;
 
-/// The platform's line end, used for every written line.
-inline constexpr std::string_view kLineEnd =
-#ifdef _WIN32
-    "\r\n";
-#else
-    "\n";
-#endif
-
 /// Returns the display name of a profile: the first line of its file, trimmed at the end. Empty if the file
 /// cannot be read.
 std::string ReadProfileName(const std::string& path);

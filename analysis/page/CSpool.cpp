@@ -1,42 +1,35 @@
 #include "CSpool.h"
 
 #include "CSafeFile.h"
+#include "Files.h"
 #include "Paths.h"
 #include "SystemError.h"
 
 #include <array>
-#include <cstdlib>
 #include <string>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace gw {
 
 namespace {
 
 // std::tmpfile ignores TMPDIR.
-std::FILE* OpenNameless()
+std::FILE* OpenStreamWithoutName()
 {
     const std::string folder = TemporaryFolder();
-    std::string path = folder + "gaitwright-XXXXXX";
-    const int file = folder.empty() ? -1 : mkostemp(path.data(), O_CLOEXEC);
-    if (file < 0)
-    {
-        if (!folder.empty())
-            KeepSystemError();
+    if (folder.empty())
         return nullptr;
-    }
-    unlink(path.c_str());
-    std::FILE* const stream = fdopen(file, "w+");
+    const int file = OpenNameless(folder);
+    std::FILE* const stream = file < 0 ? nullptr : StreamOf(file, "w+");
     if (!stream)
-        close(file);
+        KeepSystemError();
+    if (!stream && file >= 0)
+        CloseFile(file);
     return stream;
 }
 
 } // namespace
 
-CSpool::CSpool() : m_pkFile(OpenNameless()), m_iError(TakeSystemError()) {}
+CSpool::CSpool() : m_pkFile(OpenStreamWithoutName()), m_iError(TakeSystemError()) {}
 
 CSpool::~CSpool()
 {
@@ -48,13 +41,13 @@ void CSpool::Write(std::string_view text)
 {
     // A failure is kept in the stream's error flag.
     if (m_pkFile && std::fwrite(text.data(), 1, text.size(), m_pkFile) != text.size())
-        m_iError = errno;
+        m_iError = LastSystemError();
 }
 
 bool CSpool::CopyTo(CSafeFile& file)
 {
     if (m_pkFile && m_iError == 0 && std::fflush(m_pkFile) != 0)
-        m_iError = errno;
+        m_iError = LastSystemError();
     if (!m_pkFile || m_iError != 0 || std::ferror(m_pkFile))
     {
         KeepSystemError(m_iError);

@@ -1,20 +1,15 @@
 #include "PicturePainter.h"
 
 #include "CPicturePainter.h"
-#include "Paths.h"
-
-#include <dlfcn.h>
+#include "Processes.h"
 
 namespace gw {
 
 namespace {
 
-constexpr const char* kModule = "gw_picture_painter.so";
-
 CPicturePainter* OpenPainter()
 {
-    void* const module = dlopen((ExecutableFolder() + kModule).c_str(), RTLD_NOW | RTLD_LOCAL);
-    void* const entry = module ? dlsym(module, kPicturePainterEntry) : nullptr;
+    void* const entry = ModuleEntry("gw_picture_painter", kPicturePainterEntry);
     return entry ? reinterpret_cast<CPicturePainterEntry>(entry)() : nullptr;
 }
 

@@ -5,6 +5,7 @@
 
 #include <cstddef>
 #include <cstdint>
+#include <cstdio>
 #include <functional>
 #include <span>
 #include <string>
@@ -73,5 +74,9 @@ private:
     bool m_bKeeps = false;  // existing files must not be replaced
     bool m_bFailed = false;
 };
+
+/// Returns a stream of the C library that writes text to a file, with the platform's line ends; null on
+/// failure. Close it before the Commit; it fails if a write has failed.
+std::FILE* TextStreamTo(CSafeFile& file);
 
 } // namespace gw

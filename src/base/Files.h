@@ -35,6 +35,13 @@ bool CloseFile(int file);
 /// Makes a stream of the C library from a file, which closes it; null on failure. Line ends are not changed.
 std::FILE* StreamOf(int file, const char* mode);
 
+/// Opens a path as a stream of the C library with mode "r" or "w"; null on failure. Line ends are not
+/// changed.
+std::FILE* OpenStream(const std::string& path, const char* mode);
+/// Return the standard streams, which no longer change line ends.
+std::FILE* BinaryInput();
+std::FILE* BinaryOutput();
+
 /// Reads up to `size` bytes at the file's position. Returns their count, 0 at the end, or a negative number.
 ptrdiff_t ReadSome(int file, void* bytes, size_t size);
 /// Writes all bytes at the file's position or at an offset. If that fails, also keeps the reason

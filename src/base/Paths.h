@@ -1,6 +1,6 @@
 #pragma once
 
-#include "PathSeparator.h"
+#include "SystemConventions.h"
 
 #include <cstdint>
 #include <string>

@@ -1,91 +1,25 @@
-// Temporary files for pixel blocks. The folder is shared by all users of the machine, so it is checked not to
-// be a link, and file names are created exclusively.
-
 #include "CTempFile.h"
-
-#include "Paths.h"
-
-#include <cerrno>
-
-#include <fcntl.h>
-#include <sys/mman.h>
-#include <sys/stat.h>
-#include <unistd.h>
 
 namespace gw {
 
-namespace {
-
-constexpr std::string_view kNamePattern = "TK_XXXXXX.tmp";
-constexpr int kExtensionLength = 4;
-
-// Creates the folder that all users of the machine share, like the one that contains it. Returns false if
-// somebody has put a link or a file in its place.
-bool MakeSharedFolder(const std::string& folder)
-{
-    if (!FolderExists(folder) && CreateFolder(folder))
-        chmod(folder.c_str(), 01777);
-    return IsFolderItself(folder);
-}
-
-// Another program can remove the empty folder at any time before the file is created.
-int CreateIn(const std::string& folder, std::string& path)
-{
-    constexpr int kAttempts = 8;
-    for (int i = 0; i < kAttempts; ++i)
-    {
-        if (!MakeSharedFolder(folder))
-            continue; // it may have been removed again at once
-        path = folder + std::string(kNamePattern);
-        const int file = mkostemps(path.data(), kExtensionLength, O_CLOEXEC);
-        if (file >= 0)
-            return file;
-        if (errno != ENOENT)
-            break;
-    }
-    path.clear();
-    return -1;
-}
-
-} // namespace
-
 CTempFile::CTempFile(const std::string& folder, uint64_t byteCount, bool takesBlocks)
-    : m_uiSize(byteCount), m_iFile(CreateIn(folder, m_kPath)), m_bTakesBlocks(takesBlocks)
+    : m_kFile(folder, byteCount), m_uiSize(byteCount), m_bTakesBlocks(takesBlocks)
 {
-    if (m_iFile < 0 || ftruncate(m_iFile, static_cast<off_t>(byteCount)) == 0)
-        return;
-    close(m_iFile);
-    m_iFile = -1;
 }
 
-CTempFile::~CTempFile()
-{
-    if (m_iFile >= 0)
-        close(m_iFile);
-    if (!m_kPath.empty())
-        unlink(m_kPath.c_str());
-}
+CTempFile::~CTempFile() = default;
 
 bool CTempFile::Reserve(const View& view)
 {
-    int error = EINTR;
-    while (error == EINTR)
-        error =
-            posix_fallocate(m_iFile, static_cast<off_t>(view.m_uiOffset), static_cast<off_t>(view.m_uiSize));
-    return error == 0;
+    return m_kFile.Reserve(view.m_uiOffset, view.m_uiSize);
 }
 
 std::byte* CTempFile::Use(View& view)
 {
     if (!view.m_pkAddress)
-    {
-        void* const mapped = mmap(nullptr, view.m_uiSize, PROT_READ | PROT_WRITE, MAP_SHARED, m_iFile,
-                                  static_cast<off_t>(view.m_uiOffset));
-        if (mapped == MAP_FAILED)
-            return nullptr;
-        view.m_pkAddress = static_cast<std::byte*>(mapped);
-    }
-    ++view.m_iUses;
+        view.m_pkAddress = m_kFile.Map(view.m_uiOffset, view.m_uiSize);
+    if (view.m_pkAddress)
+        ++view.m_iUses;
     return view.m_pkAddress;
 }
 
@@ -98,7 +32,7 @@ void CTempFile::Drop(View& view)
 void CTempFile::Close(View& view)
 {
     if (view.m_pkAddress)
-        munmap(view.m_pkAddress, view.m_uiSize);
+        CMappingFile::Unmap(view.m_pkAddress, view.m_uiSize);
     view.m_pkAddress = nullptr;
     view.m_iUses = 0;
 }

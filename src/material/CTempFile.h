@@ -1,8 +1,10 @@
 #pragma once
 
+#include "CMappingFile.h"
+#include "CSection.h"
+
 #include <cstddef>
 #include <cstdint>
-#include <mutex>
 #include <optional>
 #include <string>
 
@@ -19,9 +21,9 @@ public:
     CTempFile& operator=(const CTempFile&) = delete;
 
     /// Returns false if the file could not be created; then call nothing else.
-    bool IsOpen() const { return m_iFile >= 0; }
+    bool IsOpen() const { return m_kFile.IsOpen(); }
     uint64_t GetSize() const { return m_uiSize; }
-    const std::string& GetPath() const { return m_kPath; }
+    const std::string& GetPath() const { return m_kFile.Path(); }
     /// Returns whether the file can hold more than one block.
     bool TakesBlocks() const { return m_bTakesBlocks; }
 
@@ -51,12 +53,11 @@ protected:
     static void Drop(View& view);
     static void Close(View& view);
 
-    std::mutex m_kSection;
+    CSection m_kSection;
 
 private:
-    std::string m_kPath;
+    CMappingFile m_kFile;
     uint64_t m_uiSize;
-    int m_iFile = -1; // stays open, because views are mapped later
     bool m_bTakesBlocks;
 };
 

@@ -5,11 +5,10 @@
 
 #include "CTempPagedFile.h"
 #include "CTempSingleFile.h"
+#include "Files.h"
 #include "Paths.h"
 
 #include <algorithm>
-
-#include <unistd.h>
 
 namespace gw {
 
@@ -82,7 +81,7 @@ uint32_t CTempStore::AllocateInNewFile(uint64_t byteCount)
                                 : AddFile(std::make_unique<CTempPagedFile>(m_kFolder));
     if (index == kFileLimit)
     {
-        rmdir(m_kFolder.c_str());
+        RemoveEmptyFolder(m_kFolder);
         return 0;
     }
     if (const std::optional<uint32_t> block = m_kFiles[index]->Allocate(byteCount))
@@ -112,7 +111,7 @@ void CTempStore::RemoveFile(size_t index)
         return;
     m_uiTotal -= m_kFiles[index]->GetSize();
     m_kFiles[index].reset();
-    rmdir(m_kFolder.c_str()); // fails while the folder contains other files
+    RemoveEmptyFolder(m_kFolder); // fails while the folder contains other files
 }
 
 void CTempStore::Free(uint32_t handle)
@@ -143,7 +142,7 @@ void CTempStore::Purge(const std::string& folder)
         return;
     for (const std::string& name : FilesInFolder(folder, ".tmp"))
         DeleteFile(WithSeparator(folder) + name);
-    rmdir(folder.c_str());
+    RemoveEmptyFolder(folder);
 }
 
 } // namespace gw

@@ -4,16 +4,16 @@
 
 #include "LinkNames.h"
 
+#include "Files.h"
+#include "NativePath.h"
 #include "Paths.h"
+#include "SystemError.h"
 #include "Text.h"
 
 #include <algorithm>
 #include <cstdint>
 #include <filesystem>
 #include <system_error>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace fs = std::filesystem;
 
@@ -36,7 +36,8 @@ bool IsRegularFile(const std::string& path)
 
 std::string_view LastPart(std::string_view name)
 {
-    return name.substr(name.find_last_of(kSeparators) + 1); // npos + 1 is 0
+    const std::string_view last = name.substr(name.find_last_of(kSeparators) + 1); // npos + 1 is 0
+    return last.substr(last.find_last_of(kSystemSeparators) + 1);                  // without a drive
 }
 
 // Joins a folder and a file name, using this platform's separators. A name that leads outside the folder
@@ -45,30 +46,37 @@ std::string Join(const std::string& folder, std::string_view name)
 {
     std::string path(name);
     std::ranges::replace(path, '\\', kPathSeparator);
-    const fs::path normal = fs::path(path).lexically_normal(); // one spelling per file
-    path = !normal.empty() && *normal.begin() == ".." ? LastPart(name) : normal.string();
+    const fs::path normal = NativePath(path).lexically_normal(); // one spelling per file
+    path = !normal.empty() && *normal.begin() == ".." ? LastPart(name) : PathText(normal);
     return folder.empty() ? path : folder + kPathSeparator + path;
+}
+
+bool AreSameFile(const std::string& a, const std::string& b)
+{
+    FileStatus first, second;
+    return StatusOf(a, first) && StatusOf(b, second) && first.device == second.device &&
+           first.inode == second.inode;
 }
 
 // Returns a path without . and .. parts if it is still the same file, so each file has one spelling. After a
 // linked folder, .. leads elsewhere.
 std::string ShortestPath(const std::string& path)
 {
-    std::error_code error;
-    const std::string normal = fs::path(path).lexically_normal().string();
-    return fs::equivalent(normal, path, error) ? normal : path;
+    const std::string normal = PathText(NativePath(path).lexically_normal());
+    return AreSameFile(normal, path) ? normal : path;
 }
 
 fs::path Normal(const std::string& path)
 {
     std::error_code error;
-    return fs::absolute(path.empty() ? "." : path, error).lexically_normal();
+    return fs::absolute(NativePath(path.empty() ? "." : path), error).lexically_normal();
 }
 
 // Returns the path below a folder with / separators, or nothing if it is not below it.
 std::string BelowFolder(const std::string& folder, const std::string& path)
 {
-    const std::string below = Normal(path).lexically_relative(Normal(folder) / "").string();
+    std::string below = PathText(Normal(path).lexically_relative(Normal(folder) / ""));
+    std::ranges::replace(below, kPathSeparator, '/');
     return below == "." || below == ".." || below.starts_with("../") ? std::string() : below;
 }
 
@@ -85,12 +93,12 @@ std::string ResolveLinkName(const std::string& folder, std::string_view name)
 
 std::string StoredLinkName(const std::string& folder, const std::string& path)
 {
-    const bool isForeign = IsFromRoot(path) && !path.starts_with('/'); // a path of another system
+    const bool isForeign = IsFromRoot(path) && !NativePath(path).is_absolute(); // a path of another system
     std::string below = isForeign ? path : BelowFolder(folder, path);
     const bool isDeep = below.find('/') != below.npos;
     // If the reader would split the name differently, store the full path instead.
     if (below.empty() || below.find('\\') != below.npos || (isDeep && below.find(':') != below.npos))
-        return isForeign ? path : Normal(path).string();
+        return isForeign ? path : PathText(Normal(path));
     if (!isDeep)
         return below;
     std::ranges::replace(below, '/', '\\');
@@ -104,14 +112,14 @@ void NoteFailedLink(const std::string& folder, std::string_view objectName, cons
         return;
     const std::string name = Join(folder, "ImageLoadFailed.txt");
     // The folder can be anybody's: do not write through a link or wait for a pipe.
-    const int file =
-        open(name.c_str(), O_WRONLY | O_CREAT | O_TRUNC | O_NOFOLLOW | O_NONBLOCK | O_CLOEXEC, 0666);
+    const int file = OpenFile(name, EOpen::Overwrite);
     if (file < 0)
         return;
-    const std::string text =
-        "LinkFileName = " + Printable(objectName) + "\nLocalLinkFileName = " + Printable(path) + '\n';
-    [[maybe_unused]] const ssize_t written = write(file, text.data(), text.size());
-    close(file);
+    std::string text = "LinkFileName = " + Printable(objectName);
+    text.append(kLineEnd).append("LocalLinkFileName = ").append(Printable(path)).append(kLineEnd);
+    if (!WriteAll(file, text))
+        ForgetSystemError();
+    CloseFile(file);
 }
 
 } // namespace gw

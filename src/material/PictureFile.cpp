@@ -9,12 +9,11 @@
 #include "CPixelBuffer.h"
 #include "CSafeFile.h"
 #include "Paths.h"
+#include "Processes.h"
 #include "Text.h"
 
 #include <algorithm>
 #include <optional>
-
-#include <dlfcn.h>
 
 using namespace std::string_view_literals;
 
@@ -23,8 +22,6 @@ namespace gw {
 namespace {
 
 constexpr uint64_t kFrameObjectBytes = 512; // the image object of a frame, which can be as small as one pixel
-
-constexpr const char* kCodecModule = "gw_picture_codec.so";
 
 // The allowed picture formats. A name in a file must not select from everything the picture library supports,
 // because some formats run commands.
@@ -91,8 +88,7 @@ const char* FormatOf(const std::string& path, std::string_view file)
 
 CPictureCodec* OpenCodec()
 {
-    void* const module = dlopen((ExecutableFolder() + kCodecModule).c_str(), RTLD_NOW | RTLD_LOCAL);
-    void* const entry = module ? dlsym(module, kPictureCodecEntry) : nullptr;
+    void* const entry = ModuleEntry("gw_picture_codec", kPictureCodecEntry);
     return entry ? reinterpret_cast<CPictureCodecEntry>(entry)() : nullptr;
 }
 

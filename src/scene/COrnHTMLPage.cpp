@@ -1,31 +1,18 @@
 #include "COrnHTMLPage.h"
 
 #include "CSafeFile.h"
+#include "Paths.h"
 
 #include <cstdarg>
-#include <filesystem>
-#include <string_view>
 
 namespace gw {
 
-namespace {
-
-ssize_t WriteSafely(void* file, const char* text, size_t size)
-{
-    return static_cast<CSafeFile*>(file)->Write(std::string_view(text, size)) ? static_cast<ssize_t>(size)
-                                                                              : 0;
-}
-
-} // namespace
-
 bool COrnHTMLPage::SaveAs(const std::string& path) const
 {
-    std::error_code error;
     CSafeFile file;
-    if (std::filesystem::is_symlink(path, error) || !file.Open(path))
+    if (IsLink(path) || !file.Open(path))
         return false;
-    std::FILE* stream =
-        fopencookie(&file, "w", {.read = nullptr, .write = WriteSafely, .seek = nullptr, .close = nullptr});
+    std::FILE* const stream = TextStreamTo(file);
     if (!stream)
         return false;
     WriteTo(stream);

@@ -3,16 +3,14 @@
 
 #include "HTMLText.h"
 
+#include "CodePoints.h"
 #include "Numbers.h"
 
 #include <algorithm>
 #include <cfloat>
 #include <cstdint>
 #include <cstdio>
-#include <optional>
 #include <span>
-
-#include <iconv.h>
 
 namespace gw {
 
@@ -30,28 +28,6 @@ constexpr EscapeRow kPageEscapes[] = {
     {'>', "&gt;"  },
     {'"', "&quot;"},
 };
-
-// Decodes a name in a character set of the C library; nothing if its bytes are not valid in it.
-std::optional<std::u32string> CodePoints(std::string_view name, const char* characterSet)
-{
-    constexpr size_t kPointsPerByte = 2; // at most, in Big5: a letter with its accent
-    constexpr char32_t kLastPoint = 0x10ffff;
-    const iconv_t converter = iconv_open("UCS-4LE", characterSet);
-    if (converter == reinterpret_cast<iconv_t>(-1))
-        return std::nullopt;
-    std::u32string points(kPointsPerByte * name.size(), U'\0');
-    char* from = const_cast<char*>(name.data()); // the interface predates const
-    char* to = reinterpret_cast<char*>(points.data());
-    size_t fromBytes = name.size();
-    size_t toBytes = points.size() * sizeof(char32_t);
-    const bool isWhole = iconv(converter, &from, &fromBytes, &to, &toBytes) != static_cast<size_t>(-1) &&
-                         iconv(converter, nullptr, nullptr, &to, &toBytes) != static_cast<size_t>(-1);
-    iconv_close(converter);
-    points.resize(points.size() - toBytes / sizeof(char32_t));
-    if (!isWhole || std::ranges::any_of(points, [](char32_t point) { return point > kLastPoint; }))
-        return std::nullopt;
-    return points;
-}
 
 void AppendToPage(std::string& out, char character)
 {
@@ -102,7 +78,7 @@ std::string InBrackets(std::span<const float> values)
 std::string HTMLText(std::string_view name)
 {
     std::string out;
-    if (const auto points = CodePoints(name, "UTF-8"))
+    if (const auto points = CodePoints(name, EEncoding::UTF8))
     {
         for (const char32_t point : *points)
         {
@@ -121,9 +97,9 @@ std::string HTMLText(std::string_view name)
 std::string HTMLScriptText(std::string_view name)
 {
     std::string out;
-    for (const char* characterSet : {"UTF-8", "BIG5-HKSCS"})
+    for (const EEncoding encoding : {EEncoding::UTF8, EEncoding::Big5})
     {
-        const auto points = CodePoints(name, characterSet);
+        const auto points = CodePoints(name, encoding);
         for (const char32_t point : points.value_or(U""))
             AppendToScript(out, point);
         if (points)

@@ -1,5 +1,6 @@
 #include "Files.h"
 
+#include "CFolderFiles.h"
 #include "SystemError.h"
 
 #include <algorithm>
@@ -116,6 +117,21 @@ bool CloseFile(int file)
 std::FILE* StreamOf(int file, const char* mode)
 {
     return fdopen(file, mode);
+}
+
+std::FILE* OpenStream(const std::string& path, const char* mode)
+{
+    return std::fopen(path.c_str(), (std::string(mode) + 'e').c_str());
+}
+
+std::FILE* BinaryInput()
+{
+    return stdin;
+}
+
+std::FILE* BinaryOutput()
+{
+    return stdout;
 }
 
 ptrdiff_t ReadSome(int file, void* bytes, size_t size)
@@ -243,6 +259,23 @@ bool ListFolder(const std::string& folder, const std::function<bool(const Folder
             break;
     }
     return directory != nullptr;
+}
+
+CFolderFiles::CFolderFiles(const std::string& folder)
+    : m_iFile(open(folder.c_str(), O_PATH | O_DIRECTORY | O_CLOEXEC))
+{
+}
+
+CFolderFiles::~CFolderFiles()
+{
+    if (m_iFile >= 0)
+        close(m_iFile);
+}
+
+bool CFolderFiles::StatusOf(const char* name, FileStatus& status) const
+{
+    struct stat from;
+    return m_iFile >= 0 && Take(fstatat(m_iFile, name, &from, 0), from, status);
 }
 
 ELock LockFile(int file)

@@ -4,6 +4,8 @@
 
 #include "Files.h"
 
+#include "CFolderFiles.h"
+#include "Paths.h"
 #include "Processes.h"
 #include "SystemError.h"
 #include "WindowsCalls.h"
@@ -215,6 +217,23 @@ std::FILE* StreamOf(int file, const char* mode)
     return _fdopen(file, (std::string(mode) + 'b').c_str());
 }
 
+std::FILE* OpenStream(const std::string& path, const char* mode)
+{
+    return _wfopen(WidePath(path).c_str(), WideText(std::string(mode) + "bN").c_str());
+}
+
+std::FILE* BinaryInput()
+{
+    _setmode(_fileno(stdin), _O_BINARY);
+    return stdin;
+}
+
+std::FILE* BinaryOutput()
+{
+    _setmode(_fileno(stdout), _O_BINARY);
+    return stdout;
+}
+
 ptrdiff_t ReadSome(int file, void* bytes, size_t size)
 {
     DWORD count = 0;
@@ -346,6 +365,15 @@ bool ListFolder(const std::string& folder, const std::function<bool(const Folder
             break;
     } while (FindNextFileW(search, &found));
     return true;
+}
+
+CFolderFiles::CFolderFiles(const std::string& folder) : m_kFolder(WithSeparator(folder)) {}
+
+CFolderFiles::~CFolderFiles() = default;
+
+bool CFolderFiles::StatusOf(const char* name, FileStatus& status) const
+{
+    return gw::StatusOf(m_kFolder + name, status);
 }
 
 // A byte far behind the end, since nobody can read or write locked bytes.

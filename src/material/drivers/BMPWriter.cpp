@@ -2,27 +2,16 @@
 
 #include "CBMPPicture.h"
 
+#include "Files.h"
+
 #include <algorithm>
 #include <cstring>
-
-#ifdef _WIN32
-#include <fcntl.h>
-#include <io.h>
-#endif
 
 namespace gw {
 
 namespace {
 
 constexpr uint32_t kHeaderBytes = 54;
-
-std::FILE* BinaryOutput()
-{
-#ifdef _WIN32
-    _setmode(_fileno(stdout), _O_BINARY);
-#endif
-    return stdout;
-}
 
 template <class... T>
 bool Write(std::FILE* file, const T&... values)
@@ -34,7 +23,7 @@ bool Write(std::FILE* file, const T&... values)
 
 bool CBMPPicture::OpenToWrite()
 {
-    m_pkOut = IsStandardStream(Name()) ? BinaryOutput() : std::fopen(Name().c_str(), "wb");
+    m_pkOut = IsStandardStream(Name()) ? BinaryOutput() : OpenStream(Name(), "w");
     return m_pkOut != nullptr;
 }
 

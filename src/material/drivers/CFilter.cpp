@@ -3,6 +3,8 @@
 
 #include "CFilter.h"
 
+#include "SystemMath.h"
+
 #include <algorithm>
 #include <cmath>
 #include <numbers>
@@ -112,7 +114,7 @@ double Sinc(double x, const void*)
 
 double Bessel(double x, const void*)
 {
-    return x == 0.0 ? kPi / 4.0 : ::j1(kPi * x) / (2.0 * x);
+    return x == 0.0 ? kPi / 4.0 : BesselJ1(kPi * x) / (2.0 * x);
 }
 
 double Hanning(double x, const void*)

@@ -1,29 +1,13 @@
 #include "CPicInput.h"
 
+#include "Files.h"
 #include "Paths.h"
 
 #include <algorithm>
 #include <array>
 #include <cstring>
 
-#ifdef _WIN32
-#include <fcntl.h>
-#include <io.h>
-#endif
-
 namespace gw {
-
-namespace {
-
-std::FILE* BinaryInput()
-{
-#ifdef _WIN32
-    _setmode(_fileno(stdin), _O_BINARY);
-#endif
-    return stdin;
-}
-
-} // namespace
 
 bool IsStandardStream(const std::string& fileName)
 {

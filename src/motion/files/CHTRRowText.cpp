@@ -1,6 +1,7 @@
 #include "CHTRRowText.h"
 
 #include "CLineWriter.h"
+#include "SystemConventions.h"
 
 #include <bit>
 #include <cmath>
@@ -47,8 +48,8 @@ char* CHTRRowText::WriteScale(char* out, float scale)
     if (!m_bHasLast || !IsSame(scale, m_kLast.scale))
     {
         char* const end = WriteColumn(m_acScale, scale);
-        std::memcpy(end, kTextLineEnd.data(), kTextLineEnd.size());
-        m_uiScale = static_cast<size_t>(end - m_acScale) + kTextLineEnd.size();
+        std::memcpy(end, kLineEnd.data(), kLineEnd.size());
+        m_uiScale = static_cast<size_t>(end - m_acScale) + kLineEnd.size();
     }
     std::memcpy(out, m_acScale, m_uiScale);
     return out + m_uiScale;

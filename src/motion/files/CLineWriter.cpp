@@ -1,5 +1,7 @@
 #include "CLineWriter.h"
 
+#include "SystemConventions.h"
+
 #include <cmath>
 #include <cstring>
 #include <utility>
@@ -60,7 +62,7 @@ CLineWriter& CLineWriter::Shortest(float value)
 
 void CLineWriter::EndLine()
 {
-    Text(kTextLineEnd);
+    Text(kLineEnd);
 }
 
 void CLineWriter::Line(std::string_view text)

@@ -9,14 +9,6 @@
 
 namespace gw {
 
-/// The platform's line end.
-inline constexpr std::string_view kTextLineEnd =
-#ifdef _WIN32
-    "\r\n";
-#else
-    "\n";
-#endif
-
 /// Writes lines of text to a sink in pieces, so the whole text is never in memory. All pieces but the last
 /// have the same size, a power of two: a file system stores a file that grows in such steps in fewer, larger
 /// pages.

@@ -1,9 +1,0 @@
-#pragma once
-
-namespace gw {
-
-/// What joins the parts of a path, and all characters that separate them for the system.
-inline constexpr char kPathSeparator = '/';
-inline constexpr const char* kSystemSeparators = "/";
-
-} // namespace gw
