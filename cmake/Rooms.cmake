@@ -88,8 +88,8 @@ function(gw_room name)
   add_library(${name} STATIC ${sources})
   target_sources(${name} PUBLIC FILE_SET HEADERS BASE_DIRS ${CMAKE_CURRENT_SOURCE_DIR} FILES ${headers})
   if(system_headers)
-    target_include_directories(${name}
-      PUBLIC $<BUILD_INTERFACE:${CMAKE_CURRENT_SOURCE_DIR}/${GAITWRIGHT_SYSTEM}>)
+    target_sources(${name} PUBLIC FILE_SET system_headers TYPE HEADERS BASE_DIRS
+                                  ${CMAKE_CURRENT_SOURCE_DIR}/${GAITWRIGHT_SYSTEM} FILES ${system_headers})
   endif()
   target_link_libraries(${name} PUBLIC ${ROOM_PUBLIC} PRIVATE ${ROOM_PRIVATE})
   target_compile_features(${name} PUBLIC cxx_std_20)

@@ -7,20 +7,18 @@
 #include "CDraftShelf.h"
 
 #include "CPrivateFile.h"
+#include "Files.h"
+#include "NativePath.h"
 #include "Paths.h"
+#include "Processes.h"
 #include "SystemError.h"
+#include "TemporaryFiles.h"
 
-#include <cerrno>
 #include <chrono>
-#include <cstdio>
-#include <cstdlib>
 #include <filesystem>
 #include <functional>
 #include <new>
 #include <thread>
-
-#include <sys/mman.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -49,23 +47,24 @@ bool Publish(const std::string& folder, const std::string& path, std::string_vie
     CPrivateFile file;
     if (!file.Create(folder, ".tmp", kMode) || !WriteAll(file.File(), text))
         return false;
-    if (fsync(file.File()) == 0 && (link(file.Path().c_str(), path.c_str()) == 0 || errno == EEXIST))
-        return true;
-    const bool isRenamed = rename(file.Path().c_str(), path.c_str()) == 0; // no hard links here
-    if (isRenamed)
+    if (SyncFile(file.File()) && RenameToFree(file.Path(), path))
+    {
         file.Release();
-    else
-        KeepSystemError();
-    return isRenamed;
+        return true;
+    }
+    if (IsNameTaken(LastSystemError()))
+        return true;
+    KeepSystemError();
+    return false;
 }
 
 // For a destructor: without memory, the folder stays.
-void RemoveFolder(const std::string& folder) noexcept
+void RemoveTree(const std::string& folder) noexcept
 {
     try
     {
         std::error_code error;
-        std::filesystem::remove_all(folder, error);
+        std::filesystem::remove_all(NativePath(folder), error);
     } catch (const std::bad_alloc&)
     {
     }
@@ -74,13 +73,10 @@ void RemoveFolder(const std::string& folder) noexcept
 } // namespace
 
 CDraftShelf::CDraftShelf(std::string folder, size_t jobCount)
-    : m_kFolder(WithSeparator(std::move(folder))), m_bTemporary(m_kFolder.empty()), m_iOwner(getpid()),
-      m_uiJobCount(jobCount)
+    : m_kFolder(WithSeparator(std::move(folder))), m_bTemporary(m_kFolder.empty()), m_uiOwner(ProcessNumber()),
+      m_uiJobCount(jobCount), m_kMemory(jobCount * sizeof(State) + 1),
+      m_pkStates(static_cast<State*>(m_kMemory.Get()))
 {
-    void* const shared = mmap(nullptr, jobCount * sizeof(State) + 1, PROT_READ | PROT_WRITE,
-                              MAP_SHARED | MAP_ANONYMOUS, -1, 0);
-    if (shared != MAP_FAILED) // all zero
-        m_pkStates = static_cast<State*>(shared);
     // Before any worker starts, since all must know it.
     if (m_bTemporary)
         OpenFolder();
@@ -88,21 +84,15 @@ CDraftShelf::CDraftShelf(std::string folder, size_t jobCount)
 
 CDraftShelf::~CDraftShelf()
 {
-    if (m_pkStates)
-        munmap(static_cast<void*>(m_pkStates), m_uiJobCount * sizeof(State) + 1);
-    if (m_bTemporary && !m_kFolder.empty() && m_iOwner == getpid())
-        RemoveFolder(m_kFolder);
+    if (m_bTemporary && !m_kFolder.empty() && m_uiOwner == ProcessNumber())
+        RemoveTree(m_kFolder);
 }
 
 bool CDraftShelf::OpenFolder()
 {
     if (!m_kFolder.empty())
         return CreateFolder(m_kFolder);
-    std::string path = TemporaryFolder() + "gaitwright-drafts-XXXXXX";
-    if (mkdtemp(path.data()))
-        m_kFolder = WithSeparator(path);
-    else
-        KeepSystemError();
+    m_kFolder = CreateTemporaryFolder("drafts");
     return !m_kFolder.empty();
 }
 

@@ -1,5 +1,7 @@
 #pragma once
 
+#include "CSharedMemory.h"
+
 #include <atomic>
 #include <cstddef>
 #include <cstdint>
@@ -7,6 +9,15 @@
 #include <string_view>
 
 namespace gw {
+
+/// Identifies a CDraftShelf to other processes.
+struct DraftShelfLink
+{
+    std::string folder;
+    bool isTemporary = false;
+    std::string memory; ///< name of the shared memory
+    size_t jobCount = 0;
+};
 
 /// Drafted profiles, one per skeleton, shared by the workers of a run. The first source of a skeleton, in the
 /// order of the run, gets a draft; all later ones use it, no matter which worker is faster. The drafts are
@@ -19,12 +30,16 @@ public:
     /// Keeps the drafts in a folder, which is created with the first one. An empty folder means a temporary
     /// one, which is deleted with the object. `jobCount` is the number of sources.
     CDraftShelf(std::string folder, size_t jobCount);
+    /// Shares the shelf of another process, on systems that cannot copy a process.
+    explicit CDraftShelf(const DraftShelfLink& link);
     ~CDraftShelf();
     CDraftShelf(const CDraftShelf&) = delete;
     CDraftShelf& operator=(const CDraftShelf&) = delete;
 
     /// Returns whether the drafts outlive the object.
     bool IsKept() const { return !m_bTemporary; }
+    /// Returns how another process can share the shelf as long as it exists.
+    DraftShelfLink Link() const;
 
     /// Starts a job in this process.
     void Begin(size_t job) { m_uiJob = job; }
@@ -48,10 +63,11 @@ private:
 
     std::string m_kFolder;
     bool m_bTemporary;
-    int m_iOwner; ///< the process that created a temporary folder
+    uint32_t m_uiOwner; ///< the process that created a temporary folder
     size_t m_uiJobCount;
     size_t m_uiJob = 0;
-    State* m_pkStates = nullptr; ///< one per job, in memory that all workers share; may be null
+    CSharedMemory m_kMemory;     ///< that all workers share
+    State* m_pkStates = nullptr; ///< in that memory, one per job; null without it
 };
 
 } // namespace gw

@@ -36,8 +36,9 @@ public:
     /// copy of the program at the time it was started; elsewhere, its handler was made from Description. Returns a
     /// number of the handler's choice.
     virtual uint8_t Run(size_t job, std::FILE* record) = 0;
-    /// Returns a text from which the program can make the same handler in another process.
-    virtual std::string Description() const = 0;
+    /// Returns a text from which the program makes the same handler in another process, on systems that cannot copy a
+    /// process.
+    virtual std::string Description() const { return {}; }
     /// Called before a job's result, complete under a private path, takes its place. Runs in the worker.
     virtual void Ready(size_t, const std::string&) {}
     /// Called immediately when a job's process has ended; nobody is working on it any more.

@@ -7,6 +7,7 @@
 #include "CCustomData.h"
 #include "CMappedFile.h"
 #include "COrrinStream.h"
+#include "Files.h"
 #include "FindingWords.h"
 #include "PackageBlocks.h"
 #include "Paths.h"
@@ -14,15 +15,12 @@
 #include "SystemError.h"
 
 #include <algorithm>
-#include <cerrno>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace gw {
 
 namespace {
 
+constexpr int kStandardInput = 0;
 constexpr size_t kStartBytes = size_t{1} << 16; // enough to find the format
 constexpr size_t kPieceBytes = size_t{1} << 18;
 constexpr uint64_t kStreamLimit = uint64_t{1} << 32; // larger than any motion that fits into memory
@@ -35,9 +33,7 @@ bool ReadPiece(int file, size_t size, std::string& bytes)
     bytes.resize(end);
     while (done < end)
     {
-        const ssize_t count = read(file, bytes.data() + done, end - done);
-        if (count < 0 && errno == EINTR)
-            continue;
+        const ptrdiff_t count = ReadSome(file, bytes.data() + done, end - done);
         if (count <= 0)
         {
             bytes.resize(done);
@@ -59,13 +55,13 @@ class COpenedStream
 public:
     explicit COpenedStream(const std::string& path)
         : m_bOwned(path != kStandardStream),
-          m_iFile(m_bOwned ? open(path.c_str(), O_RDONLY | O_CLOEXEC) : STDIN_FILENO)
+          m_iFile(m_bOwned ? OpenFile(path, EOpen::ReadStream) : kStandardInput)
     {
     }
     ~COpenedStream()
     {
         if (m_bOwned && m_iFile >= 0)
-            close(m_iFile);
+            CloseFile(m_iFile);
     }
     COpenedStream(const COpenedStream&) = delete;
     COpenedStream& operator=(const COpenedStream&) = delete;
@@ -106,7 +102,7 @@ bool CSourceFile::CopyStream(const std::string& path)
     const COpenedStream stream(path);
     std::string start;
     if (stream.File() < 0 || !ReadPiece(stream.File(), kStartBytes, start))
-        return Fail(path, "read-error", "this cannot be read" + SystemErrorWords(errno));
+        return Fail(path, "read-error", "this cannot be read" + SystemErrorWords(LastSystemError()));
     if (start.empty())
         return Fail(path, "empty", "there is nothing to read");
     const std::string_view extension = ExtensionOfContent(start);
@@ -132,7 +128,7 @@ bool CSourceFile::CopyRest(int file, std::string& start, const std::string& path
             return false;
         piece.clear();
         if (!ReadPiece(file, kPieceBytes, piece))
-            return Fail(path, "read-error", "the end cannot be read" + SystemErrorWords(errno));
+            return Fail(path, "read-error", "the end cannot be read" + SystemErrorWords(LastSystemError()));
     }
     return true;
 }

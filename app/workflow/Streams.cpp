@@ -1,19 +1,11 @@
 #include "Streams.h"
 
 #include "Paths.h"
-
-#include <algorithm>
-
-#include <sys/stat.h>
+#include "StandardStreams.h"
 
 namespace gw {
 
 namespace {
-
-// Redirected to a file, these are links to it. The file belongs to the shell that opened it, and must not be
-// replaced by another one.
-constexpr std::string_view kDescriptors[] = {"/dev/fd/", "/proc/self/fd/", "/dev/stdin", "/dev/stdout",
-                                             "/dev/stderr"};
 
 constexpr std::string_view kContainerMark = "TKOrrin Version";
 constexpr std::string_view kPackageMark = "MotionInfo"; // the name of a block at the start
@@ -43,17 +35,12 @@ constexpr ContentRow kContents[] = {
 
 bool IsStream(const std::string& path)
 {
-    if (path == kStandardStream ||
-        std::ranges::any_of(kDescriptors, [&](std::string_view name) { return path.starts_with(name); }))
-        return true;
-    struct stat status;
-    return stat(path.c_str(), &status) == 0 && !S_ISREG(status.st_mode) && !S_ISDIR(status.st_mode);
+    return path == kStandardStream || IsStreamPath(path);
 }
 
 bool IsStandardOutput(const std::string& path)
 {
-    return path == kStandardStream || path == "/dev/stdout" || path == "/dev/fd/1" ||
-           path == "/proc/self/fd/1";
+    return path == kStandardStream || IsStandardOutputPath(path);
 }
 
 std::string InFolder(const std::string& output, const std::string& source, std::string_view extension)

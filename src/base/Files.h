@@ -21,6 +21,7 @@ enum class EOpen : uint8_t
     Existing,   ///< for reading and writing; fails for a link
     New,        ///< for reading and writing; fails if anything has the name
     Overwrite,  ///< for writing, with its old content cut; fails for a link
+    WriteStream, ///< for writing to a pipe or device; waits for its other end
     Append,     ///< for reading, and for writing at its end; created if it does not exist
     AppendAnew, ///< same, with its old content cut
 };

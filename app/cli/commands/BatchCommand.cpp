@@ -24,15 +24,6 @@ namespace gw {
 
 namespace {
 
-// The desktop program uses the selected profile. Without --profile, use the one that `convert` would choose
-// for the first file.
-bool SelectProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first)
-{
-    if (options.job != "htr")
-        return true;
-    return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
-}
-
 void WriteJson(const ShellOptions& options, const std::vector<Notice>& notices, size_t finished, bool failed)
 {
     CJsonWriter json(stdout);
@@ -67,7 +58,7 @@ EExit RunBatchJobs(const ShellOptions& options, const CFileRun::Jobs& jobs)
     if (options.draft) // one profile for all files, so one draft at most
         conversion.UseDrafts(drafts.emplace(options.drafts, 1));
     CBatchRun run(options, jobs, StateOf(options), conversion, ownNotices);
-    const bool begins = SelectProfile(options, conversion, jobs.front().source);
+    const bool begins = SelectBatchProfile(options, conversion, jobs.front().source);
     const EExit exit = begins ? run.RunAll() : EExit::Failed;
     std::vector<Notice> notices = ownNotices.All();
     notices.insert(notices.end(), run.Notices().begin(), run.Notices().end());

@@ -4,16 +4,13 @@
 #include "CommandTable.h"
 #include "JsonStatus.h"
 #include "LiveNames.h"
+#include "StandardStreams.h"
 #include "SystemError.h"
+#include "WorkerStart.h"
 #include "Words.h"
 
-#include <cerrno>
-#include <csignal>
 #include <cstdio>
 #include <new>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -33,35 +30,20 @@ EExit RunArguments(int argc, char** argv)
     }
 }
 
-// If the caller has closed a standard stream, the next opened file would get its number, and messages would
-// be written into a result.
-void OpenStandardStreams()
-{
-    for (const int stream : {STDIN_FILENO, STDOUT_FILENO, STDERR_FILENO})
-    {
-        if (fcntl(stream, F_GETFD) < 0 && errno == EBADF)
-            open("/dev/null", O_RDWR); // gets the lowest free number, which is this stream's
-    }
-}
-
 } // namespace
 
 int RunProgram(int argc, char** argv)
 {
-    OpenStandardStreams();
+    PrepareStandardStreams();
+    ServeIfWorker(argc, argv);
     RemovePrivateFilesOnSignals();
-#ifdef SIGXFSZ
-    // With the signal ignored, exceeding a file size limit fails the write like a full disk; otherwise it
-    // would end the program and leave half a file.
-    std::signal(SIGXFSZ, SIG_IGN);
-#endif
     EExit exit = RunArguments(argc, argv);
     if (IsJsonAsked(argc, argv))
         FinishJson(argv[1], exit);
-    errno = 0;
+    ClearLastSystemError();
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {
-        SayError({}, "write-error", "standard output cannot be written" + SystemErrorWords(errno));
+        SayError({}, "write-error", "standard output cannot be written" + SystemErrorWords(LastSystemError()));
         exit = EExit::Failed;
     }
     return static_cast<int>(exit);

@@ -2,12 +2,10 @@
 
 #include "OptionTable.h"
 
-#include "CProgressBar.h"
+#include "Terminal.h"
 #include "Text.h"
 
 #include <algorithm>
-
-#include <unistd.h>
 
 namespace gw {
 
@@ -121,7 +119,7 @@ constexpr size_t kLeastWidth = 50;  // narrower columns are harder to read than 
 
 size_t HelpWidth()
 {
-    return isatty(STDOUT_FILENO) != 0 ? std::max(TerminalWidth(STDOUT_FILENO), kLeastWidth) : kUsualWidth;
+    return IsTerminal(stdout) ? std::max(TerminalWidth(stdout), kLeastWidth) : kUsualWidth;
 }
 
 // Breaks a paragraph into lines that fit; those after the first are indented. Its own line breaks count as

@@ -2,7 +2,9 @@
 
 #include "CJsonWriter.h"
 #include "CSafeFile.h"
+#include "Files.h"
 #include "JsonStatus.h"
+#include "NativePath.h"
 #include "Paths.h"
 #include "Streams.h"
 #include "SystemError.h"
@@ -13,6 +15,15 @@
 #include <filesystem>
 
 namespace gw {
+
+namespace {
+
+bool IsReadableFolder(const std::string& path)
+{
+    return ListFolder(path, [](const FolderEntry&) { return false; });
+}
+
+} // namespace
 
 bool IsDecidedOnExisting(const ShellOptions& options)
 {
@@ -29,10 +40,8 @@ bool IsTaken(const std::string& path)
 
 Notice UnreadableFolder(const std::string& path)
 {
-    std::error_code error;
-    const std::filesystem::directory_iterator entries(path, error);
-    return MakeNotice(path, "unreadable-folder",
-                      "the folder cannot be read" + SystemErrorWords(error.value()));
+    const int error = IsReadableFolder(path) ? 0 : LastSystemError();
+    return MakeNotice(path, "unreadable-folder", "the folder cannot be read" + SystemErrorWords(error));
 }
 
 std::optional<Notice> WhyNoSource(const std::string& path)
@@ -42,23 +51,22 @@ std::optional<Notice> WhyNoSource(const std::string& path)
     if (!IsLink(path) || FileExists(path))
         return std::nullopt;
     std::error_code error;
-    const std::string target = std::filesystem::read_symlink(path, error).string();
+    const std::string target = PathText(std::filesystem::read_symlink(NativePath(path), error));
     return MakeNotice(path, "dead-link", "a link to a file that does not exist: " + Quoted(target));
 }
 
 bool CanListFolder(const ShellOptions& options, const std::string& path)
 {
-    std::error_code error;
-    const std::filesystem::directory_iterator entries(path, error);
-    if (error)
+    const bool isReadable = IsReadableFolder(path);
+    if (!isReadable)
         SayNotice(options, UnreadableFolder(path));
-    return !error;
+    return isReadable;
 }
 
 bool IsSameFile(const std::string& a, const std::string& b)
 {
     std::error_code error;
-    return std::filesystem::equivalent(a, b, error);
+    return std::filesystem::equivalent(NativePath(a), NativePath(b), error);
 }
 
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path)

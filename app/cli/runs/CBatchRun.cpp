@@ -22,6 +22,13 @@ EBatchJob BatchJobOf(const ShellOptions& options)
     return options.job == "htr" ? EBatchJob::ToMotion : EBatchJob::ToContainer;
 }
 
+bool SelectBatchProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first)
+{
+    if (BatchJobOf(options) != EBatchJob::ToMotion)
+        return true;
+    return (!options.profile.empty() || conversion.Open(first)) && conversion.SelectProfile();
+}
+
 CBatchRun::CBatchRun(const ShellOptions& options, Jobs jobs, RunState state, CShellConversion& conversion,
                      CShellNotices& notices)
     : CFileRun(options, std::move(jobs), std::move(state)), conversion_(conversion), ownNotices_(notices)

@@ -26,6 +26,7 @@ public:
     const std::vector<Notice>& Notices() const { return m_kNotices; }
     /// Returns the number of files that were started.
     size_t TakenCount() const { return m_uiTaken; }
+    const CShellConversion& Conversion() const { return conversion_; }
 
 protected:
     FileEnd Convert(const ShellOptions& options, size_t index, std::FILE* record) override;
@@ -50,5 +51,8 @@ private:
 
 /// Returns the job for the option --job.
 EBatchJob BatchJobOf(const ShellOptions& options);
+/// Selects the profile of a batch run, if it needs one: the one in the options or, without, the one that `convert` would
+/// choose for the first file. Returns false, after reporting the reason, if none can be used.
+bool SelectBatchProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first);
 
 } // namespace gw

@@ -18,6 +18,7 @@
 namespace gw {
 
 class CContentHash;
+class CJsonMembers;
 struct Notice;
 
 /// Where a run keeps its state for the next run.
@@ -43,6 +44,9 @@ public:
     const RunTally& Tally() const { return m_kTally; }
 
     uint8_t Run(size_t job, std::FILE* record) final;
+    std::string Description() const final;
+    /// Continues a run in a worker that was made from its description; `head` is the first line.
+    void BeginInWorker(const CJsonMembers& head);
     void Ready(size_t job, const std::string& privatePath) final;
     void Lost(size_t job) final;
     bool Take(size_t job, const JobEnd& end) final;

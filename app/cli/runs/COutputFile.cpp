@@ -1,22 +1,20 @@
 #include "COutputFile.h"
 
 #include "CMappedFile.h"
+#include "Files.h"
 #include "LiveNames.h"
 #include "Output.h"
 #include "Paths.h"
 #include "ShellOptions.h"
 #include "Streams.h"
 #include "SystemError.h"
+#include "TemporaryFiles.h"
+#include "Terminal.h"
 #include "Words.h"
 
 #include <algorithm>
 #include <array>
-#include <cerrno>
 #include <cstdio>
-#include <cstdlib>
-
-#include <fcntl.h>
-#include <unistd.h>
 
 namespace gw {
 
@@ -48,7 +46,7 @@ bool COutputFile::Open(const std::string& path, std::string_view extension)
     m_kPath = path;
     if (!IsStream(path))
         return true;
-    if (IsStandardOutput(path) && isatty(STDOUT_FILENO) != 0 && !IsForTerminal(extension))
+    if (IsStandardOutput(path) && IsTerminal(stdout) && !IsForTerminal(extension))
         return Fail("a terminal cannot show this format; redirect standard output to a file or a program");
     return Create(extension) || Fail("a temporary file cannot be written" + TakeSystemErrorWords());
 }
@@ -57,17 +55,9 @@ bool COutputFile::Open(const std::string& path, std::string_view extension)
 // one, which other programs sweep.
 bool COutputFile::Create(std::string_view extension)
 {
-    const std::string folder = TemporaryFolder();
-    std::string path = folder + "gaitwright-XXXXXX" + std::string(extension);
-    const int file =
-        folder.empty() ? -1 : mkostemps(path.data(), static_cast<int>(extension.size()), O_CLOEXEC);
-    if (file < 0)
-    {
-        if (!folder.empty())
-            KeepSystemError();
+    const std::string path = CreateTemporaryFile(extension);
+    if (path.empty())
         return false;
-    }
-    close(file);
     m_kCopy = path;
     m_iLiveName = AddLiveName(m_kCopy);
     return true;
@@ -77,7 +67,7 @@ void COutputFile::Remove()
 {
     if (m_kCopy.empty())
         return;
-    unlink(m_kCopy.c_str());
+    RemoveFile(m_kCopy.c_str());
     RemoveLiveName(m_iLiveName);
     m_kCopy.clear();
 }
@@ -95,20 +85,21 @@ bool COutputFile::Deliver()
     CMappedFile written;
     if (written.Open(m_kCopy) != EFailure::None)
         return Fail("the temporary file cannot be read" + TakeSystemErrorWords());
-    errno = 0;
-    std::FILE* const stream =
-        IsStandardOutput(m_kPath) ? stdout : std::fopen(m_kPath.c_str(), "we"); // never creates a file
+    ClearLastSystemError();
+    std::FILE* const stream = IsStandardOutput(m_kPath)
+                                  ? stdout
+                                  : StreamOf(OpenFile(m_kPath, EOpen::WriteStream), "w"); // never creates a file
     if (!stream)
-        return Fail("this cannot be opened" + SystemErrorWords(errno));
+        return Fail("this cannot be opened" + SystemErrorWords(LastSystemError()));
     const std::string_view text = written.Text();
     const bool isWritten = std::fwrite(text.data(), 1, text.size(), stream) == text.size();
-    const int error = errno;
+    const int error = LastSystemError();
     const bool isFlushed = stream == stdout ? std::fflush(stream) == 0 : std::fclose(stream) == 0;
     if (isWritten && isFlushed)
         return true;
     if (stream == stdout)
         std::clearerr(stdout); // reported here
-    return Fail("this cannot be written" + SystemErrorWords(isWritten ? errno : error));
+    return Fail("this cannot be written" + SystemErrorWords(isWritten ? LastSystemError() : error));
 }
 
 bool COutputFile::DeliverOrSay()

@@ -12,14 +12,13 @@
 #include "NoticeJson.h"
 #include "NoticeKinds.h"
 #include "ProfileNames.h"
+#include "Terminal.h"
 #include "Text.h"
 #include "Words.h"
 
 #include <algorithm>
 #include <cstdio>
 #include <set>
-
-#include <unistd.h>
 
 namespace gw {
 
@@ -51,9 +50,9 @@ bool HasMember(std::string_view record, std::string_view key)
 // Returns a line that fits the terminal; whole lines go to files and pipes.
 std::string Fitting(std::string line)
 {
-    if (isatty(STDERR_FILENO) == 0 || line.size() < TerminalWidth())
+    if (!IsTerminal(stderr) || line.size() < TerminalWidth(stderr))
         return line;
-    return std::string(FirstCharacters(line, TerminalWidth() - 4)) + "...";
+    return std::string(FirstCharacters(line, TerminalWidth(stderr) - 4)) + "...";
 }
 
 void SayLine(const std::string& line)

@@ -5,6 +5,7 @@
 #include "ResultExtension.h"
 #include "RunSetup.h"
 #include "SourceList.h"
+#include "StandardStreams.h"
 #include "Streams.h"
 #include "TKImportStream.h"
 #include "Text.h"
@@ -48,7 +49,7 @@ private:
     static std::string FileName(std::string clip)
     {
         std::ranges::replace_if(
-            clip, [](char c) { return c == '/' || c == '\\' || c == '\0'; }, '_');
+            clip, [](char c) { return ForbiddenInFileNames().find(c) != std::string_view::npos; }, '_');
         return clip;
     }
 

@@ -5,9 +5,6 @@
 
 #include <algorithm>
 #include <charconv>
-#include <cstring>
-
-#include <sys/wait.h>
 
 namespace gw {
 
@@ -41,10 +38,7 @@ Notice LostNotice(const ConversionJob& job, const JobEnd& end, float limit)
         return MakeNotice(job.source, "no-record",
                           "the messages about it cannot be stored (is there a limit on the size of "
                           "files?)");
-    const std::string cause = WIFSIGNALED(end.status)
-                                  ? std::string(strsignal(WTERMSIG(end.status)))
-                                  : "exit code " + std::to_string(WEXITSTATUS(end.status));
-    return MakeNotice(job.source, "crashed", "the conversion crashed (" + cause + "); nothing was written");
+    return MakeNotice(job.source, "crashed", "the conversion crashed (" + end.cause + "); nothing was written");
 }
 
 } // namespace gw

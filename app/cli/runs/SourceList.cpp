@@ -4,6 +4,7 @@
 #include "SourceList.h"
 
 #include "CMappedFile.h"
+#include "Files.h"
 #include "Paths.h"
 #include "SourceTree.h"
 #include "Streams.h"
@@ -23,7 +24,7 @@ std::vector<std::string> Steps(const std::string& path)
 {
     std::vector<std::string> steps;
     std::string_view rest = path;
-    for (std::string_view step = NextToken(rest, "/"); !step.empty(); step = NextToken(rest, "/"))
+    for (std::string_view step = NextToken(rest, kSystemSeparators); !step.empty(); step = NextToken(rest, kSystemSeparators))
     {
         if (step != "." && step != "..")
             steps.emplace_back(step);
@@ -35,14 +36,14 @@ std::string Joined(std::span<const std::string> steps)
 {
     std::string path;
     for (const std::string& step : steps)
-        path += (path.empty() ? "" : "/") + step;
+        path += (path.empty() ? "" : std::string(1, kPathSeparator)) + step;
     return path;
 }
 
 // Reads a list from standard input, or from a pipe.
 bool ReadStream(const std::string& path, std::string& text)
 {
-    std::FILE* const stream = path == kStandardStream ? stdin : std::fopen(path.c_str(), "re");
+    std::FILE* const stream = path == kStandardStream ? stdin : StreamOf(OpenFile(path, EOpen::ReadStream), "r");
     if (!stream)
         return false;
     constexpr size_t kLimit = size_t{1} << 30; // far above any list, and ends a stream without end

@@ -33,7 +33,7 @@ using Clock = std::chrono::steady_clock;
 constexpr auto kPatience = 5s; // to wait for a process that was asked to end
 constexpr auto kGlance = 2ms;
 
-void CloseDescriptor(int& file)
+void CloseEnd(int& file)
 {
     if (file >= 0)
         close(std::exchange(file, -1));
@@ -115,7 +115,7 @@ CWorkerChild::~CWorkerChild()
         std::this_thread::sleep_for(kGlance);
     }
     for (int* file : {&m_iOutput, &m_iWords, &m_iRecord})
-        CloseDescriptor(*file);
+        CloseEnd(*file);
 }
 
 void CWorkerChild::WaitForAny(std::span<CWorkerChild* const> children, std::chrono::milliseconds limit)
@@ -157,7 +157,7 @@ std::string CWorkerChild::Wait()
 
 void CWorkerChild::Close()
 {
-    CloseDescriptor(m_iSocket);
+    CloseEnd(m_iSocket);
 }
 
 std::string CWorkerChild::TakeOutput()

@@ -26,6 +26,7 @@ constexpr int kFlags[] = {
     O_RDWR | O_NOFOLLOW | O_NONBLOCK,                       // Existing
     O_RDWR | O_CREAT | O_EXCL,                              // New
     O_WRONLY | O_CREAT | O_TRUNC | O_NOFOLLOW | O_NONBLOCK, // Overwrite
+    O_WRONLY | O_CREAT | O_TRUNC,                           // WriteStream
     O_RDWR | O_CREAT | O_APPEND,                            // Append
     O_RDWR | O_CREAT | O_APPEND | O_TRUNC,                  // AppendAnew
 };

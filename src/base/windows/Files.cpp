@@ -39,6 +39,7 @@ constexpr OpenRow kOpen[] = {
     {GENERIC_READ | GENERIC_WRITE,             OPEN_EXISTING, FILE_FLAG_OPEN_REPARSE_POINT}, // Existing
     {GENERIC_READ | GENERIC_WRITE | WRITE_DAC, CREATE_NEW,    0                           }, // New
     {GENERIC_WRITE,                            OPEN_ALWAYS,   FILE_FLAG_OPEN_REPARSE_POINT}, // Overwrite
+    {GENERIC_WRITE,                            OPEN_EXISTING, 0                           }, // WriteStream
     {FILE_GENERIC_READ | kAppend,              OPEN_ALWAYS,   0                           }, // Append
     {FILE_GENERIC_READ | kAppend,              CREATE_ALWAYS, 0                           }, // AppendAnew
 };
