@@ -108,6 +108,7 @@ endfunction()
 function(gw_tests name)
   file(GLOB sources CONFIGURE_DEPENDS *.cpp ${GAITWRIGHT_SYSTEM}/*.cpp)
   add_executable(${name} ${sources})
+  target_include_directories(${name} PRIVATE ${CMAKE_CURRENT_SOURCE_DIR})
   target_link_libraries(${name} PRIVATE ${ARGN} gw_test_support GTest::gmock GTest::gtest_main)
   gw_compile_options(${name})
   # Tests are compiled once for each run, and the libraries that they test are optimized as usual.

@@ -93,12 +93,13 @@ std::string ResolveLinkName(const std::string& folder, std::string_view name)
 
 std::string StoredLinkName(const std::string& folder, const std::string& path)
 {
-    const bool isForeign = IsFromRoot(path) && !NativePath(path).is_absolute(); // a path of another system
-    std::string below = isForeign ? path : BelowFolder(folder, path);
+    if (IsFromRoot(path) && !NativePath(path).is_absolute())
+        return path; // of another system
+    std::string below = BelowFolder(folder, path);
     const bool isDeep = below.find('/') != below.npos;
     // If the reader would split the name differently, store the full path instead.
     if (below.empty() || below.find('\\') != below.npos || (isDeep && below.find(':') != below.npos))
-        return isForeign ? path : PathText(Normal(path));
+        return PathText(Normal(path));
     if (!isDeep)
         return below;
     std::ranges::replace(below, '/', '\\');

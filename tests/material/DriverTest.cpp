@@ -6,51 +6,14 @@
 #include "TempFolder.h"
 
 #include <cstdio>
-#include <fcntl.h>
 #include <gtest/gtest.h>
 #include <tuple>
-#include <unistd.h>
 #include <vector>
 
 namespace gw {
 namespace {
 
 using namespace std::string_view_literals;
-
-// A BMP file under construction. Rows are given as stored in the file.
-struct MadeBMP
-{
-    int32_t width = 0;
-    int32_t height = 0;
-    uint16_t depth = 24;
-    std::vector<uint32_t> palette;
-    std::string rows;
-    uint32_t compression = 0;
-    uint32_t headerBytes = 40;
-    uint32_t gap = 0; // before the pixels
-
-    std::string Bytes() const
-    {
-        const auto paletteBytes = static_cast<uint32_t>(4 * palette.size());
-        std::string bytes = "BM";
-        const auto add = [&](auto value) {
-            bytes.append(reinterpret_cast<const char*>(&value), sizeof value);
-        };
-        add(uint32_t{0});
-        add(uint32_t{0});
-        add(14 + headerBytes + paletteBytes + gap);
-        add(headerBytes);
-        add(width);
-        add(height);
-        add(uint16_t{1});
-        add(depth);
-        add(compression);
-        bytes.append(20 + headerBytes - 40, '\0');
-        for (const uint32_t color : palette)
-            add(color);
-        return bytes + std::string(gap, '\x55') + rows;
-    }
-};
 
 // Colors as stored: blue in the lowest byte.
 const std::vector<uint32_t> kTwoColors = {0x00112233, 0x00aabbcc};
@@ -96,37 +59,6 @@ protected:
     CTempFolder m_kFolder;
 };
 
-// Temporarily replaces the standard input by a file or by a pipe with its bytes.
-class StandardInput
-{
-public:
-    StandardInput(const std::string& path, bool piped) : m_iSaved(dup(0))
-    {
-        int ends[2] = {open(path.c_str(), O_RDONLY), -1};
-        if (piped)
-        {
-            const std::string bytes = ReadBytes(path); // few enough for a pipe to hold
-            close(ends[0]);
-            EXPECT_EQ(pipe(ends), 0);
-            EXPECT_EQ(write(ends[1], bytes.data(), bytes.size()), static_cast<ssize_t>(bytes.size()));
-            close(ends[1]);
-        }
-        dup2(ends[0], 0);
-        close(ends[0]);
-        std::clearerr(stdin);
-    }
-    ~StandardInput()
-    {
-        dup2(m_iSaved, 0);
-        close(m_iSaved);
-        // Discards data that was read ahead from the old input.
-        EXPECT_NE(std::freopen("/dev/null", "rb", stdin), nullptr);
-    }
-
-private:
-    int m_iSaved;
-};
-
 TEST_F(DriverTest, BMPReadsEveryDepth)
 {
     const auto expect = [&](uint16_t depth, const std::vector<uint32_t>& palette, std::string_view row,
@@ -167,8 +99,6 @@ TEST_F(DriverTest, BMPReadsEveryDepth)
     expect(32, {}, "\x01\x02\x03\x04\xff\xfe\xfd\0"sv, "030201.04 fdfeff.00", "\2\xfd"sv);
 }
 
-const std::string kThreeRows("\x01\x01\x01\0\x02\x02\x02\0\x03\x03\x03\0", 12);
-
 TEST_F(DriverTest, BMPGivesTheRowsOfAFileInItsOrder)
 {
     for (const int height : {3, -3})
@@ -186,34 +116,6 @@ TEST_F(DriverTest, BMPGivesTheRowsOfAFileInItsOrder)
         EXPECT_FALSE(picture->ReadRow(0, -1, 1, pixels));
         EXPECT_FALSE(picture->ReadRow(0, 0, 2, pixels));
         EXPECT_FALSE(picture->WriteRow(0, 0, 1, pixels));
-    }
-}
-
-TEST_F(DriverTest, BMPGivesTheRowsOfAStreamFromTheTop)
-{
-    // The requested rows and the results, by the number that their pixels are made of; 0 for no result.
-    const std::tuple<const char*, int, bool, std::string_view, std::string_view> cases[] = {
-        {"a file, bottom up", 3, false, "012", "321"},  {"a file, top down", -3, false, "012", "123"},
-        {"a file, back again", -3, false, "20", "31"},  {"a pipe, top down", -3, true, "02", "13"},
-        {"a pipe, bottom up", 3, true, "210", "123"},   {"a pipe, and back", -3, true, "101", "202"},
-        {"a pipe, in pieces", 3, true, "2200", "1133"},
-    };
-    for (const auto& [what, height, pipe, order, rows] : cases)
-    {
-        SCOPED_TRACE(what);
-        WriteBytes(Path(), MadeBMP{1, height, 24, {}, kThreeRows, 0, 40, 5}.Bytes());
-        const StandardInput input(Path(), pipe);
-        const auto picture = OpenPicture("-.bmp", "r");
-        ASSERT_TRUE(picture);
-        EXPECT_FALSE(picture->IsBottomFirst());
-        std::string found;
-        for (const char y : order)
-        {
-            PixelRGBA pixel{};
-            picture->ReadRowRGBA(y - '0', 0, 1, &pixel);
-            found += static_cast<char>('0' + pixel.g);
-        }
-        EXPECT_EQ(found, rows);
     }
 }
 

@@ -1,7 +1,6 @@
 // GIF files: known bytes, codes of every size from the test's own encoder, and damage.
 
 #include "CGIFReader.h"
-#include "CImage.h"
 #include "CPicInput.h"
 #include "DriverSamples.h"
 #include "TempFolder.h"
@@ -152,24 +151,6 @@ TEST(CGIFReader, ReadsCodesOfEverySize)
 }
 
 // Runs of pixels with codes of their own, as a library writes them.
-TEST(CGIFReader, ReadsLongRuns)
-{
-    const CTempFolder folder;
-    const uint8_t blue[4] = {255, 0, 0, 255};
-    const Ref<CImage> written = new CImage;
-    written->Pixels().Create(700, 100, 0, blue);
-    for (int x = 0; x < 700; x += 3)
-        std::memset(CPixelLock(written->Pixels()).Row(x % 100) + ptrdiff_t{4} * x, 255, 4);
-    ASSERT_TRUE(written->Save(folder.Path("a.gif"), 90));
-    GIFImage image;
-    ASSERT_TRUE(ReadFirst(ReadBytes(folder.Path("a.gif")), image));
-    const CPixelView view(written->Pixels());
-    for (size_t i = 0; i < 70000; ++i)
-        ASSERT_EQ(image.palette[image.pixels[i]].r,
-                  view.Row(static_cast<int32_t>(i / 700))[4 * (i % 700) + 2])
-            << i;
-}
-
 TEST(CGIFReader, PutsInterlacedRowsInOrder)
 {
     for (const unsigned height : {1u, 2u, 3u, 5u, 8u, 9u, 21u})

@@ -124,7 +124,7 @@ TEST(TKBVHStream, WritesTheseBytes)
     TKBVHStream writer(file.motion);
     ASSERT_TRUE(writer.WriteFile(file.folder.Path("b.bvh")));
     EXPECT_EQ(
-        ReadBytes(file.folder.Path("b.bvh")),
+        ReadText(file.folder.Path("b.bvh")),
         R"(HIERARCHY
 ROOT Hips
 {

@@ -111,7 +111,7 @@ TEST(TKHTRStream, TakesTheHeaderAsItStands)
     EXPECT_EQ(PosedNode(noRate.motion, "Torso", 1).m_kMatrix.Translation(), (Vec3{1, 102, 3}))
         << "begin time";
     ASSERT_TRUE(noRate.motion.Save(noRate.path, 1.0f));
-    EXPECT_NE(ReadBytes(noRate.path).find("NumFrames 2\nDataFrameRate 0\n"), std::string::npos);
+    EXPECT_NE(ReadText(noRate.path).find("NumFrames 2\nDataFrameRate 0\n"), std::string::npos);
 
     CLoadedMotion axisX(Changed(kSmallHTR, {"", "BoneLengthAxis Y", "BoneLengthAxis X"}), "a.htr");
     const Mat4& mesh = FindBoneMesh(*axisX.motion.motionRoot)->m_kMatrix;
@@ -217,7 +217,7 @@ TEST(TKHTRStream, WritesTheseBytes)
     {
         SCOPED_TRACE(frameScale);
         ASSERT_TRUE(file.motion.Save(file.folder.Path("b.HTR"), frameScale));
-        EXPECT_EQ(ReadBytes(file.folder.Path("b.HTR")),
+        EXPECT_EQ(ReadText(file.folder.Path("b.HTR")),
                   "[Header]\nFileType htr\nDataType HTRS\nFileVersion 1\nNumSegments 2\nNumFrames " + frames +
                       Written(torso));
     }

@@ -104,11 +104,11 @@ TEST_F(ProfileEditor, WrittenFileIsTheReadFileByteForByte)
     Load(text);
     EXPECT_EQ(RowText(m_kEditor.Rows(), 1), "B|Head|0|0|0|||") << "the neutral triple shows nothing";
     EXPECT_TRUE(m_kEditor.WriteProfile(EProfileWrite::Quiet));
-    EXPECT_EQ(ReadBytes(m_kEditor.ProfilePath()), text);
+    EXPECT_EQ(ReadText(m_kEditor.ProfilePath()), text);
 
     Load("N \nPosition 1.9 -2.9 nan\n* Waist . 7,8,9,1,2,-3\n");
     m_kEditor.WriteProfile(EProfileWrite::Quiet);
-    EXPECT_EQ(ReadBytes(m_kEditor.ProfilePath()),
+    EXPECT_EQ(ReadText(m_kEditor.ProfilePath()),
               "N\nFrameRate 90\nPosition 1 -2 0\n* Waist . .1,2,-3\n* LPelvis . .1,2,3\n* RPelvis . .1,2,3\n")
         << "cut toward zero; a fixed row loses its rotation";
 }

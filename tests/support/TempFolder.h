@@ -27,6 +27,12 @@ void WriteBytes(const std::string& path, std::string_view bytes);
 /// Returns the bytes of a file. If it cannot be read, the test fails and gets no bytes.
 std::string ReadBytes(const std::string& path);
 
+/// Same for a text file of this program, with "\n" for the platform's line ends.
+std::string ReadText(const std::string& path);
+
+/// Creates a symbolic link; false where the system, or the user, cannot have any.
+bool MakeLink(const std::string& target, const std::string& path);
+
 /// Returns the folder of files that are too large for this repository, with a trailing separator. Empty if
 /// the environment does not name one; tests that need it then return.
 std::string SharedDataFolder();

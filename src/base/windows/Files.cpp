@@ -139,17 +139,32 @@ bool IsPassing(DWORD error)
     return error == ERROR_ACCESS_DENIED || error == ERROR_SHARING_VIOLATION;
 }
 
-// The second call also replaces a file that others have open, but not in a single step.
-bool Replace(const wchar_t* from, const wchar_t* to)
+// Replaces a file that others are reading, which one call cannot do on every version of the system: it is
+// renamed first, and is gone when they close it. Not to a private name, which a sweep could delete if the
+// program ended here.
+bool ReplaceOpenFile(const std::wstring& from, const std::wstring& to)
 {
-    if (MoveFileExW(from, to, MOVEFILE_REPLACE_EXISTING))
-        return true;
+    constexpr DWORD kKept = FILE_ATTRIBUTE_READONLY | FILE_ATTRIBUTE_DIRECTORY;
+    const std::wstring aside = to + L".replaced-" + std::to_wstring(GetCurrentProcessId());
+    if ((GetFileAttributesW(to.c_str()) & kKept) != 0 || !MoveFileExW(to.c_str(), aside.c_str(), 0))
+    {
+        SetLastError(ERROR_ACCESS_DENIED);
+        return false;
+    }
+    const bool isReplaced = MoveFileExW(from.c_str(), to.c_str(), 0) != 0;
     const DWORD error = GetLastError();
-    constexpr DWORD kFlags = REPLACEFILE_IGNORE_MERGE_ERRORS | REPLACEFILE_IGNORE_ACL_ERRORS;
-    if (IsPassing(error) && ReplaceFileW(to, from, nullptr, kFlags, nullptr, nullptr))
-        return true;
+    if (isReplaced)
+        DeleteFileW(aside.c_str());
+    else
+        MoveFileExW(aside.c_str(), to.c_str(), 0);
     SetLastError(error);
-    return false;
+    return isReplaced;
+}
+
+bool Replace(const std::wstring& from, const std::wstring& to)
+{
+    return MoveFileExW(from.c_str(), to.c_str(), MOVEFILE_REPLACE_EXISTING) ||
+           (GetLastError() == ERROR_ACCESS_DENIED && ReplaceOpenFile(from, to));
 }
 
 // Writes at the file's position, or at the one in `place`.
@@ -331,7 +346,7 @@ bool RenameFile(const std::string& from, const std::string& to)
     constexpr DWORD kPauseMilliseconds = 20;
     const std::wstring wideFrom = WidePath(from);
     const std::wstring wideTo = WidePath(to);
-    for (int i = 1; !Replace(wideFrom.c_str(), wideTo.c_str()); ++i)
+    for (int i = 1; !Replace(wideFrom, wideTo); ++i)
     {
         if (i == kAttempts || !IsPassing(GetLastError()))
             return false;
