@@ -16,12 +16,31 @@ DONE, FAILED, USAGE = 0, 1, 2
 SECONDS = 60  # for a run that takes a tenth of one, on a busy machine under a sanitizer
 
 
+# The program for Windows runs under an emulator: its paths have other separators, and it knows no pipes or signals.
+WINDOWS = os.environ.get("GAITWRIGHT_SYSTEM") == "windows"
+
+
+def posix_only(reason):
+    """Skips a test, or a class of tests, on Windows."""
+    return unittest.skipIf(WINDOWS, reason)
+
+
+def without_backslashes(text):
+    """Returns output with the separators that the tests expect, also within JSON, where they are doubled."""
+    def plain(line):
+        return line.replace("\\\\", "/") if line.startswith(("{", "[")) else line.replace("\\", "/")
+    return "".join(map(plain, text.splitlines(True))).replace("Z:/", "/")
+
+
 class Result:
     def __init__(self, done):
         self.code = done.returncode
         self.bytes = done.stdout
         self.out = done.stdout.decode("utf-8", "replace")  # whatever the names in a file: output is UTF-8
         self.err = done.stderr.decode("utf-8")
+        if WINDOWS:
+            self.out = without_backslashes(self.out)
+            self.err = without_backslashes(self.err)
 
 
 class CliTest(unittest.TestCase):

@@ -183,6 +183,7 @@ void AddOptions(CLI::App& app, const ShellCommand& command, std::span<char* cons
     }
     app.add_option("files", options.files);
     app.allow_extras();
+    app.allow_windows_style_options(false); // a word that begins with a slash is a path everywhere
 }
 
 // Counts how many of the options of an exclusive choice a command line has.

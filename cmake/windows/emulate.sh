@@ -1,0 +1,8 @@
+#!/bin/sh
+# Runs a program for Windows with wine, whose files are in the folder of builds: emulate.sh PROGRAM [ARGUMENTS...]
+here=$(dirname "$(readlink -f "$0")")
+WINEPREFIX=${GAITWRIGHT_WINEPREFIX:-$here/../../build/wine}
+WINEDEBUG=-all
+export WINEPREFIX WINEDEBUG
+wine=$(PATH=$PATH:/usr/lib/wine command -v wine64) || wine=/usr/lib/wine/wine64
+exec "$wine" "$@"
