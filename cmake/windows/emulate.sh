@@ -3,6 +3,8 @@
 here=$(dirname "$(readlink -f "$0")")
 WINEPREFIX=${GAITWRIGHT_WINEPREFIX:-$here/../../build/wine}
 WINEDEBUG=-all
-export WINEPREFIX WINEDEBUG
+HOME=$WINEPREFIX # where wine leaves files of its own
+export WINEPREFIX WINEDEBUG HOME
+mkdir -p "$WINEPREFIX"
 wine=$(PATH=$PATH:/usr/lib/wine command -v wine64) || wine=/usr/lib/wine/wine64
 exec "$wine" "$@"

@@ -1,5 +1,7 @@
 #include "CLeftKeys.h"
 
+#include "LeftKeyCodes.h"
+
 #include <QCoreApplication>
 #include <QKeyEvent>
 #include <QMouseEvent>
@@ -12,13 +14,6 @@ namespace {
 
 std::optional<EKey> LeftKey(const QKeyEvent& event)
 {
-#ifdef _WIN32
-    constexpr quint32 kLeftCtrl = 0xa2;
-    constexpr quint32 kLeftShift = 0xa0;
-#else
-    constexpr quint32 kLeftCtrl = 0xffe3; // X key symbols
-    constexpr quint32 kLeftShift = 0xffe1;
-#endif
     switch (event.nativeVirtualKey())
     {
     case kLeftCtrl:

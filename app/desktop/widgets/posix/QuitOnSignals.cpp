@@ -4,19 +4,11 @@
 #include <QSocketNotifier>
 #include <QWidget>
 
-#ifndef _WIN32
 #include <csignal>
 #include <sys/socket.h>
 #include <unistd.h>
-#endif
 
 namespace gw {
-
-#ifdef _WIN32
-
-void QuitOnSignals(QObject*) {}
-
-#else
 
 namespace {
 
@@ -51,7 +43,5 @@ void QuitOnSignals(QObject* parent)
     for (const int number : {SIGTERM, SIGINT, SIGHUP})
         std::signal(number, Note);
 }
-
-#endif
 
 } // namespace gw

@@ -1,0 +1,65 @@
+"""Converts the same motions with the program of this system and with the one for Windows, and compares the results byte
+for byte: compare_programs.py PROGRAM WINDOWS_PROGRAM EMULATOR. Text files have the line ends of their system."""
+import json
+import os
+import struct
+import subprocess
+import sys
+import tempfile
+from pathlib import Path
+
+ROOT = Path(__file__).resolve().parents[2]
+DATA = os.environ.get("GAITWRIGHT_TEST_DATA")
+FORMATS = ("htr", "bvh", "glb", "Kinetra")
+PROFILE = "Poser BVH"
+
+
+def conversions():
+    """Yields a name and the arguments of a conversion without its output."""
+    for source in sorted((ROOT / "examples").glob("*.bvh")):
+        for options in ([], ["--align", "--faithful"], ["--no-legs"]):
+            yield source.stem + "".join(options), [source, "--data-dir", ROOT / "assets", "--profile", PROFILE, *options]
+    for folder in ("golden", "golden-gaps") if DATA else ():
+        for case in json.loads((Path(DATA) / folder / "cases.json").read_text()):
+            place = Path(DATA) / folder / case["name"]
+            legs = [] if case["legs"] else ["--no-legs"]
+            yield case["name"], [place / "source.bvh", "--data-dir", Path(DATA) / "golden" / "skeleton", "--profile",
+                                 place / "map.prf", *legs]
+
+
+def comparable(path):
+    """Returns the bytes of a result with the line ends of this system, also in the text that a package holds."""
+    content = path.read_bytes()
+    if path.suffix == ".glb":
+        return content
+    if path.suffix != ".Kinetra":
+        return content.replace(b"\r\n", b"\n")
+    start = next(at for at in range(4, len(content)) if struct.unpack_from("<I", content, at - 4)[0] == len(content) - at)
+    text = content[start:].replace(b"\r\n", b"\n")
+    return content[:start - 4] + struct.pack("<I", len(text)) + text
+
+
+def main():
+    program, windows_program, emulator = sys.argv[1:]
+    differing = []
+    count = 0
+    with tempfile.TemporaryDirectory() as folder:
+        for name, arguments in conversions():
+            for extension in FORMATS:
+                results = []
+                for system, command in (("here", [program]), ("windows", [emulator, windows_program])):
+                    result = Path(folder) / ("%s.%s" % (system, extension))
+                    done = subprocess.run([*command, "convert", *map(str, arguments), "-o", str(result), "--force"],
+                                          capture_output=True)
+                    results.append(comparable(result) if done.returncode == 0 else done.stderr)
+                count += 1
+                if results[0] != results[1]:
+                    differing.append("%s.%s" % (name, extension))
+    for name in differing:
+        print("differs:", name)
+    print("%d of %d results are the same bytes" % (count - len(differing), count))
+    return 1 if differing or not count else 0
+
+
+if __name__ == "__main__":
+    sys.exit(main())
