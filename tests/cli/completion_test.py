@@ -8,7 +8,7 @@ import subprocess
 import time
 import unittest
 
-from harness import DONE, PROGRAM, USAGE, CliTest, main
+from harness import DONE, PROGRAM, USAGE, CliTest, main, posix_only
 
 PATIENCE = 20  # seconds
 
@@ -68,6 +68,7 @@ class Shell:
         os.waitpid(self.process, 0)
 
 
+@posix_only("completion is for shells of other systems")
 class Completion(CliTest):
     def setUp(self):
         super().setUp()

@@ -92,7 +92,7 @@ class Containers(CliTest):
         node = json.loads(self.run_program("info", "odd.orn", "--json").out)["objects"][0]
         self.assertEqual(node["fields"]["m_kMatrix"][:5], ["nan", "inf", "-inf", 1e-45, 0])
         self.write("name.orn", Container().node(1, b"\x1b]0;\xff\"\\\n", root=True).bytes)
-        told = json.loads(self.run_program("info", "name.orn", "--json").out)["objects"][0]
+        told = json.loads(self.run_program("info", "name.orn", "--json").bytes)["objects"][0]
         self.assertEqual(told["name"], "\x1b]0;\ufffd\"\\\n")
         self.assertNotIn("\x1b", self.run_program("info", "name.orn").out)
 

@@ -3,7 +3,7 @@ import json
 import os
 import subprocess
 
-from harness import ASSETS, DONE, FAILED, PROGRAM, SECONDS, CliTest, main
+from harness import ASSETS, DONE, FAILED, PROGRAM, SECONDS, CliTest, main, posix_only
 from made import BVH, bvh, profile
 
 def nested(depth):
@@ -38,6 +38,7 @@ class Files(CliTest):
                     self.assertEqual(self.files(), ["out.htr", "small.prf", "take.bvh"])
                     self.assertEqual(self.read("out.htr"), b"old")
 
+    @posix_only("the emulator opens closed streams")
     def test_a_closed_stream_leaves_its_number_to_no_result(self):
         self.write("take.bvh", BVH)
         expected = self.with_assets("convert", "take.bvh", "-o", "out.htr", "--force", "--profile", "small.prf")
@@ -51,6 +52,7 @@ class Files(CliTest):
                                       preexec_fn=lambda: [os.close(stream) for stream in closed])
                 self.assertEqual((done.returncode, self.read("out.htr")), (DONE, good))
 
+    @posix_only("the emulator shows no links")
     def test_a_link_to_nothing_is_written_through_only_when_forced(self):
         self.write("take.bvh", BVH)
         (self.folder / "link.htr").symlink_to("made.htr")

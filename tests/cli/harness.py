@@ -80,6 +80,10 @@ class CliTest(unittest.TestCase):
     def read(self, name):
         return (self.folder / name).read_bytes()
 
+    def read_text(self, name):
+        """The bytes of a text file, whose line ends are those of the system."""
+        return self.read(name).replace(b"\r\n", b"\n")
+
     def files(self):
         """All files below the folder, hidden ones included, so that nothing is left behind unseen."""
         return sorted(str(p.relative_to(self.folder)) for p in self.folder.rglob("*") if p.is_file())

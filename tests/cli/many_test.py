@@ -1,7 +1,7 @@
 """Folders and several sources, the batch run, and what is told of profiles and results."""
 import json
 
-from harness import FAILED, ROOT, WALK, CliTest, main
+from harness import FAILED, ROOT, WALK, CliTest, main, posix_only
 from made import BVH, one_bone_scene, profile
 
 WAVE = ROOT / "examples" / "wave.bvh"
@@ -106,6 +106,7 @@ class Told(CliTest):
         self.write("home/.config/user-dirs.dirs", 'XDG_DOCUMENTS_DIR="$HOME/Papers"\n')
         self.write("home/Papers/BVH Profile/%s.prf" % name, profile(name, rows))
 
+    @posix_only("the registry has the folder; see CRegistryPlatform")
     def test_a_users_own_profile_is_found_by_its_name(self):
         self.install("Mine", [("hip", "LowerTorso")])
         self.assertIn("Mine (own", self.succeed("profiles").out)

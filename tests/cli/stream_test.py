@@ -4,7 +4,7 @@ import signal
 import subprocess
 import threading
 
-from harness import ASSETS, FAILED, PROGRAM, USAGE, WALK, CliTest, main
+from harness import WINDOWS, ASSETS, FAILED, PROGRAM, USAGE, WALK, CliTest, main, posix_only
 
 
 class Streams(CliTest):
@@ -21,7 +21,7 @@ class Streams(CliTest):
         rows = [  # arguments, source, the file with the same bytes as standard output
             ("convert -", "walk.bvh", "walk.Kinetra"),
             ("convert - -o - --format htr", "walk.bvh", "walk.htr"),
-            ("convert /dev/stdin -o - --format htr", "walk.bvh", "walk.htr"),
+            ("convert %s -o - --format htr" % ("-" if WINDOWS else "/dev/stdin"), "walk.bvh", "walk.htr"),
             ("extract - -o -", "walk.Kinetra", "walk.htr"),
             ("align - -o -", "walk.bvh", "aligned.bvh"),
             ("transcode - - --format bvh", "walk.htr", "walk-2.bvh"),
@@ -39,6 +39,7 @@ class Streams(CliTest):
                             for name in ("walk.bvh", "-"))
             self.assertEqual(named.replace("walk.bvh", "-"), piped)
 
+    @posix_only("named pipes and devices of other systems")
     def test_pipes_and_devices_are_written_and_stay(self):
         for name in ("in", "out.htr"):
             os.mkfifo(self.folder / name)
@@ -77,6 +78,7 @@ class Streams(CliTest):
                 self.assertEqual(self.with_assets(*line.split()).code, code)
                 self.assertFalse([name for name in self.files() if name.split("/")[-1].startswith("-")])
 
+    @posix_only("there is no signal for a closed pipe")
     def test_a_reader_that_leaves_ends_the_program_and_leaves_no_file(self):
         self.environment["TMPDIR"] = str(self.folder)
         known = self.files()

@@ -31,7 +31,7 @@ class Suggest(CliTest):
         told = self.succeed("suggest", "strange_walk.bvh", "-o", "new.prf")
         for bone in THIRTEEN:
             self.assertRegex(told.out, rf"(?m)^{bone} .* likely: ")
-        self.assertTrue(self.read("new.prf").startswith(b"strange walk\n"))
+        self.assertTrue(self.read_text("new.prf").startswith(b"strange walk\n"))
         self.succeed("convert", "strange_walk.bvh", "-o", "a.htr", "--profile", "new.prf", "--no-legs")
         measured = json.loads(self.succeed("compare", "strange_walk.bvh", "a.htr", "--profile", "new.prf", "--json").out)
         bones = {bone["target"]: bone for bone in measured["bones"] if bone["measured"]}
@@ -42,7 +42,7 @@ class Suggest(CliTest):
         for seconds, rate in (("0.05", 30), ("0.002", 240), ("0.02", 50)):
             self.write("walk.bvh", re.sub(r"(Frame Time:) .*", rf"\1 {seconds}", WALK.read_text()))
             told = self.succeed("suggest", "walk.bvh", "-o", "new.prf", "--force")
-            self.assertIn(b"\nFrameRate %d\n" % rate, self.read("new.prf"))
+            self.assertIn(b"\nFrameRate %d\n" % rate, self.read_text("new.prf"))
             self.assertEqual("frames per second" in told.err, rate != 50, seconds)
             self.assertNotIn("avaliable", self.succeed("convert", "walk.bvh", "-o", "a.htr", "--force",
                                                       "--profile", "new.prf").err)
@@ -61,7 +61,7 @@ class Suggest(CliTest):
         self.assertEqual((result.code, self.read("old.prf")), (FAILED, b"mine"))
         self.assert_words(result, ["old.prf", "--force"])
         self.succeed("suggest", "walk.bvh", "-o", "old.prf", "--force")
-        self.assertTrue(self.read("old.prf").startswith(b"walk\n"))
+        self.assertTrue(self.read_text("old.prf").startswith(b"walk\n"))
 
     def test_real_files_get_whole_profiles(self):
         for path in sorted(Path(DATA, "bvh").glob("*.bvh")) if DATA else []:

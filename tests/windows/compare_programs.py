@@ -12,6 +12,7 @@ ROOT = Path(__file__).resolve().parents[2]
 DATA = os.environ.get("GAITWRIGHT_TEST_DATA")
 FORMATS = ("htr", "bvh", "glb", "Kinetra")
 PROFILE = "Poser BVH"
+TEXT_SIZE, TEXT_START = 373, 381  # in a package: the size of its motion file in bytes, and the file
 
 
 def conversions():
@@ -34,9 +35,9 @@ def comparable(path):
         return content
     if path.suffix != ".Kinetra":
         return content.replace(b"\r\n", b"\n")
-    start = next(at for at in range(4, len(content)) if struct.unpack_from("<I", content, at - 4)[0] == len(content) - at)
-    text = content[start:].replace(b"\r\n", b"\n")
-    return content[:start - 4] + struct.pack("<I", len(text)) + text
+    text = content[TEXT_START:].replace(b"\r\n", b"\n")
+    assert struct.unpack_from("<I", content, TEXT_SIZE)[0] == len(content) - TEXT_START
+    return content[:TEXT_SIZE] + struct.pack("<I", len(text)) + content[TEXT_SIZE + 4:TEXT_START] + text
 
 
 def main():

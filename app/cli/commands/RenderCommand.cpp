@@ -215,7 +215,7 @@ bool Draw(const ShellOptions& shell, const PictureOptions& options)
     const EPictureAnswer answer =
         isAnimated ? WriteAnimation(output, options, AnimationOf(options)) : RenderPicture(options, picture);
     if (answer == EPictureAnswer::NoPainter)
-        return Refuse("no-painter", "drawing needs gw_picture_painter.so next to the program, and the "
+        return Refuse("no-painter", "drawing needs the module gw_picture_painter next to the program, and the "
                                     "libraries that it loads");
     if (answer != EPictureAnswer::Done && answer != EPictureAnswer::Stopped)
         return Refuse("no-display",

@@ -42,7 +42,8 @@ void PrepareConsole()
 
 bool IsClosed(int stream)
 {
-    return _get_osfhandle(stream) < 0; // -1 without a file, -2 without a handle
+    const intptr_t handle = _get_osfhandle(stream); // -1 without a file, -2 without a handle
+    return handle < 0 || GetFileType(reinterpret_cast<HANDLE>(handle)) == FILE_TYPE_UNKNOWN;
 }
 
 } // namespace
