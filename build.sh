@@ -8,7 +8,10 @@
 #   ./build.sh thread-test  the tests of the library under ThreadSanitizer
 #   ./build.sh bench        runs the benchmarks: ratios within one run
 #   ./build.sh fuzz [SECONDS]  feeds every reader with broken files, 60 seconds each
-#   ./build.sh package      makes Debian packages in build/release/packages and tries them
+#   ./build.sh package      makes Debian packages in build/release/packages and tries them, and a .zip for Windows in
+#                           build/windows/packages if its compiler is there
+#   ./build.sh windows      builds the shell program for Windows into build/windows/bin
+#   ./build.sh windows-test runs its tests with wine, and compares its results with those of the program of this system
 #   ./build.sh cluster-test runs the lines of docs/clusters.md with Slurm and GNU parallel on this machine
 #   ./build.sh lint [COUNT]  checks formatting and runs the linter, on all sources or on those that were changed last
 set -euo pipefail
@@ -25,6 +28,7 @@ packages_test=(libgtest-dev libgmock-dev locales python3 xvfb xauth xdotool dbus
 packages_bench=(libbenchmark-dev python3 time)
 packages_cluster=(slurm-wlm munge parallel)
 packages_lint=(clang-format clang-tidy)
+packages_windows=(g++-mingw-w64-x86-64-posix googletest wine64 python3)
 packages_fuzz=(clang libclang-rt-14-dev python3)
 
 need() {
@@ -140,6 +144,25 @@ package)
   build release
   ctest --test-dir build/release --output-on-failure --no-tests=error -R '^package' -j "$(nproc)"
   ls -l build/release/packages/*.deb
+  if command -v x86_64-w64-mingw32-g++-posix >/dev/null && [ -d /usr/src/googletest ]; then
+    build windows gaitwright assets
+    (cd build/windows && cpack -B packages >/dev/null)
+    ls -l build/windows/packages/*.zip
+  fi
+  ;;
+windows)
+  need "${packages_build[@]}" "${packages_engine[@]}" "${packages_windows[@]}"
+  build windows gaitwright assets
+  ;;
+windows-test)
+  prepare
+  need "${packages_windows[@]}"
+  build release shell
+  cmake/windows/emulate.sh cmd /c ver >/dev/null 2>&1 || true # makes wine's files before tests need them at once
+  build windows
+  run_tests windows
+  GAITWRIGHT_TEST_DATA=$(realpath ../shared/data) python3 tests/windows/compare_programs.py \
+    build/release/bin/gaitwright build/windows/bin/gaitwright.exe cmake/windows/emulate.sh
   ;;
 asan)
   prepare
@@ -175,7 +198,7 @@ lint)
   lint "${2:-}"
   ;;
 *)
-  sed -n '4,14s/^# *//p' "$0"
+  sed -n '4,17s/^# *//p' "$0"
   exit 2
   ;;
 esac
