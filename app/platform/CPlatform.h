@@ -45,8 +45,8 @@ public:
 /// custom data, whose key path is given, or in the user's documents if the product is not installed.
 std::string CustomProfileFolder(const CPlatform& platform, const std::string& keyPath);
 
-/// Returns the folder of the program's data with a trailing separator: next to the executable, as in a build. An
-/// installation keeps files that are the same on all machines in a separate folder.
+/// Returns the folder of the program's data with a trailing separator: next to the executable, as in a build.
+/// An installation keeps files that are the same on all machines in a separate folder.
 std::string InstalledDataFolder();
 
 /// Returns the primary language of a locale number.

@@ -6,8 +6,8 @@
 
 namespace gw {
 
-/// Makes many files durable at once, at the end of a run; syncing each when it is written would take most of the
-/// run's time.
+/// Makes many files durable at once, at the end of a run; syncing each when it is written would take most of
+/// the run's time.
 class CDeferredSync
 {
 public:
@@ -16,11 +16,11 @@ public:
     CDeferredSync(const CDeferredSync&) = delete;
     CDeferredSync& operator=(const CDeferredSync&) = delete;
 
-    /// Adds the file system of a file or folder; without a call that syncs a file system, only the file, or all
-    /// files below the folder. Sync reports write failures from here on.
+    /// Adds the file system of a file or folder; without a call that syncs a file system, only the file, or
+    /// all files below the folder. Sync reports write failures from here on.
     void Add(const std::string& path);
-    /// Waits until everything that was added is on disk. Returns a path where a write has failed since Add, or an
-    /// empty text.
+    /// Waits until everything that was added is on disk. Returns a path where a write has failed since Add,
+    /// or an empty text.
     std::string Sync() const;
 
 private:

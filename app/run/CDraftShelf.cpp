@@ -73,8 +73,8 @@ void RemoveTree(const std::string& folder) noexcept
 } // namespace
 
 CDraftShelf::CDraftShelf(std::string folder, size_t jobCount)
-    : m_kFolder(WithSeparator(std::move(folder))), m_bTemporary(m_kFolder.empty()), m_uiOwner(ProcessNumber()),
-      m_uiJobCount(jobCount), m_kMemory(jobCount * sizeof(State) + 1),
+    : m_kFolder(WithSeparator(std::move(folder))), m_bTemporary(m_kFolder.empty()),
+      m_uiOwner(ProcessNumber()), m_uiJobCount(jobCount), m_kMemory(jobCount * sizeof(State) + 1),
       m_pkStates(static_cast<State*>(m_kMemory.Get()))
 {
     // Before any worker starts, since all must know it.

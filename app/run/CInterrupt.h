@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// While it exists, requests to end (Ctrl-C, SIGTERM, hang-up, a closed console) do not end the program but are
-/// counted. Requests that were ignored at program start stay ignored.
+/// While it exists, requests to end (Ctrl-C, SIGTERM, hang-up, a closed console) do not end the program but
+/// are counted. Requests that were ignored at program start stay ignored.
 class CInterrupt
 {
 public:

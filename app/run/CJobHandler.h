@@ -19,7 +19,7 @@ struct JobEnd
 
     EKind kind = EKind::Ran;
     uint8_t answer = 0;
-    std::string cause; ///< such as "Segmentation fault"
+    std::string cause;    ///< such as "Segmentation fault"
     double seconds = 0.0; ///< time spent working, without waiting for its turn
     std::string output;   ///< standard output
     std::string words;    ///< standard error
@@ -32,12 +32,12 @@ class CJobHandler
 public:
     virtual ~CJobHandler() = default;
 
-    /// Does a job. Runs in a worker process, so changes in memory stay there. Where the system can, the process is a
-    /// copy of the program at the time it was started; elsewhere, its handler was made from Description. Returns a
-    /// number of the handler's choice.
+    /// Does a job. Runs in a worker process, so changes in memory stay there. Where the system can, the
+    /// process is a copy of the program at the time it was started; elsewhere, its handler was made from
+    /// Description. Returns a number of the handler's choice.
     virtual uint8_t Run(size_t job, std::FILE* record) = 0;
-    /// Returns a text from which the program makes the same handler in another process, on systems that cannot copy a
-    /// process.
+    /// Returns a text from which the program makes the same handler in another process, on systems that
+    /// cannot copy a process.
     virtual std::string Description() const { return {}; }
     /// Called before a job's result, complete under a private path, takes its place. Runs in the worker.
     virtual void Ready(size_t, const std::string&) {}

@@ -22,9 +22,9 @@ namespace {
 
 using EState = CWorkerProcess::EState;
 
-constexpr size_t kAhead = 4;               // processes per active one, including those that wait
+constexpr size_t kAhead = 4;                    // processes per active one, including those that wait
 constexpr std::chrono::milliseconds kTick(100); // maximum time between ticks
-constexpr std::chrono::seconds kGrace(10); // for running jobs when the run must end
+constexpr std::chrono::seconds kGrace(10);      // for running jobs when the run must end
 
 } // namespace
 

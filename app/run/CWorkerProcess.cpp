@@ -20,7 +20,8 @@ CWorkerProcess::CWorkerProcess() = default;
 
 CWorkerProcess::~CWorkerProcess() = default;
 
-std::vector<CWorkerChild*> CWorkerProcess::ChildrenOf(std::span<const std::unique_ptr<CWorkerProcess>> workers)
+std::vector<CWorkerChild*>
+CWorkerProcess::ChildrenOf(std::span<const std::unique_ptr<CWorkerProcess>> workers)
 {
     std::vector<CWorkerChild*> children;
     for (const auto& worker : workers)

@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// Sent to a worker: do this job or, if the worker has asked, replace its file. A closed connection means no, and
-/// no further jobs.
+/// Sent to a worker: do this job or, if the worker has asked, replace its file. A closed connection means no,
+/// and no further jobs.
 struct WorkerOrder
 {
     uint64_t job = 0;

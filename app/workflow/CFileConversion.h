@@ -1,10 +1,10 @@
 #pragma once
 
 #include "CConversion.h"
-#include "CSystemPlatform.h"
 #include "CMotionFile.h"
 #include "CRetargeter.h"
 #include "CSourceMotion.h"
+#include "CSystemPlatform.h"
 #include "EditMotion.h"
 #include "FindBone.h"
 #include "ProfileRows.h"

@@ -1,11 +1,11 @@
 #pragma once
 
 #include "CDialogAnswers.h"
-#include "CSystemPlatform.h"
 #include "CGaitConvertContent.h"
 #include "CGaitConvertFrame.h"
 #include "CLeftKeys.h"
 #include "CSkin.h"
+#include "CSystemPlatform.h"
 #include "TempFolder.h"
 
 #include <QImage>

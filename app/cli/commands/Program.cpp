@@ -6,8 +6,8 @@
 #include "LiveNames.h"
 #include "StandardStreams.h"
 #include "SystemError.h"
-#include "WorkerStart.h"
 #include "Words.h"
+#include "WorkerStart.h"
 
 #include <cstdio>
 #include <new>
@@ -43,7 +43,8 @@ int RunProgram(int argc, char** argv)
     ClearLastSystemError();
     if (std::fflush(stdout) != 0 || std::ferror(stdout))
     {
-        SayError({}, "write-error", "standard output cannot be written" + SystemErrorWords(LastSystemError()));
+        SayError({}, "write-error",
+                 "standard output cannot be written" + SystemErrorWords(LastSystemError()));
         exit = EExit::Failed;
     }
     return static_cast<int>(exit);

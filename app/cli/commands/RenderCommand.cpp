@@ -215,8 +215,9 @@ bool Draw(const ShellOptions& shell, const PictureOptions& options)
     const EPictureAnswer answer =
         isAnimated ? WriteAnimation(output, options, AnimationOf(options)) : RenderPicture(options, picture);
     if (answer == EPictureAnswer::NoPainter)
-        return Refuse("no-painter", "drawing needs the module gw_picture_painter next to the program, and the "
-                                    "libraries that it loads");
+        return Refuse("no-painter",
+                      "drawing needs the module gw_picture_painter next to the program, and the "
+                      "libraries that it loads");
     if (answer != EPictureAnswer::Done && answer != EPictureAnswer::Stopped)
         return Refuse("no-display",
                       "the OpenGL driver cannot draw this picture without a display; Mesa's driver can");

@@ -14,8 +14,8 @@
 
 namespace gw {
 
-CDetailHandler::CDetailHandler(const ShellOptions& options, std::span<const ConversionJob> jobs, CDraftShelf* drafts,
-                               std::vector<size_t> worst, CConversionPage* page)
+CDetailHandler::CDetailHandler(const ShellOptions& options, std::span<const ConversionJob> jobs,
+                               CDraftShelf* drafts, std::vector<size_t> worst, CConversionPage* page)
     : options_(options), jobs_(jobs), drafts_(drafts), m_kWorst(std::move(worst)), page_(page)
 {
 }

@@ -51,8 +51,8 @@ private:
 
 /// Returns the job for the option --job.
 EBatchJob BatchJobOf(const ShellOptions& options);
-/// Selects the profile of a batch run, if it needs one: the one in the options or, without, the one that `convert` would
-/// choose for the first file. Returns false, after reporting the reason, if none can be used.
+/// Selects the profile of a batch run, if it needs one: the one in the options or, without, the one that
+/// `convert` would choose for the first file. Returns false, after reporting the reason, if none can be used.
 bool SelectBatchProfile(const ShellOptions& options, CShellConversion& conversion, const std::string& first);
 
 } // namespace gw

@@ -7,8 +7,8 @@
 #include "CFileRun.h"
 
 #include "CContentHash.h"
-#include "CSystemPlatform.h"
 #include "CSafeFile.h"
+#include "CSystemPlatform.h"
 #include "CTextFile.h"
 #include "CWorkerPool.h"
 #include "CommandTable.h"

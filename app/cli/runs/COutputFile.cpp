@@ -86,9 +86,9 @@ bool COutputFile::Deliver()
     if (written.Open(m_kCopy) != EFailure::None)
         return Fail("the temporary file cannot be read" + TakeSystemErrorWords());
     ClearLastSystemError();
-    std::FILE* const stream = IsStandardOutput(m_kPath)
-                                  ? stdout
-                                  : StreamOf(OpenFile(m_kPath, EOpen::WriteStream), "w"); // never creates a file
+    std::FILE* const stream = IsStandardOutput(m_kPath) ? stdout
+                                                        : StreamOf(OpenFile(m_kPath, EOpen::WriteStream),
+                                                                   "w"); // never creates a file
     if (!stream)
         return Fail("this cannot be opened" + SystemErrorWords(LastSystemError()));
     const std::string_view text = written.Text();

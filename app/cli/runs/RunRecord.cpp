@@ -38,7 +38,8 @@ Notice LostNotice(const ConversionJob& job, const JobEnd& end, float limit)
         return MakeNotice(job.source, "no-record",
                           "the messages about it cannot be stored (is there a limit on the size of "
                           "files?)");
-    return MakeNotice(job.source, "crashed", "the conversion crashed (" + end.cause + "); nothing was written");
+    return MakeNotice(job.source, "crashed",
+                      "the conversion crashed (" + end.cause + "); nothing was written");
 }
 
 } // namespace gw

@@ -24,7 +24,8 @@ std::vector<std::string> Steps(const std::string& path)
 {
     std::vector<std::string> steps;
     std::string_view rest = path;
-    for (std::string_view step = NextToken(rest, kSystemSeparators); !step.empty(); step = NextToken(rest, kSystemSeparators))
+    for (std::string_view step = NextToken(rest, kSystemSeparators); !step.empty();
+         step = NextToken(rest, kSystemSeparators))
     {
         if (step != "." && step != "..")
             steps.emplace_back(step);
@@ -43,7 +44,8 @@ std::string Joined(std::span<const std::string> steps)
 // Reads a list from standard input, or from a pipe.
 bool ReadStream(const std::string& path, std::string& text)
 {
-    std::FILE* const stream = path == kStandardStream ? stdin : StreamOf(OpenFile(path, EOpen::ReadStream), "r");
+    std::FILE* const stream =
+        path == kStandardStream ? stdin : StreamOf(OpenFile(path, EOpen::ReadStream), "r");
     if (!stream)
         return false;
     constexpr size_t kLimit = size_t{1} << 30; // far above any list, and ends a stream without end

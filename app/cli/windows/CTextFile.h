@@ -12,7 +12,10 @@ namespace gw {
 class CTextFile
 {
 public:
-    CTextFile() : m_iFile(OpenNameless(TemporaryFolder())), m_pkFile(m_iFile < 0 ? nullptr : StreamOf(m_iFile, "w+")) {}
+    CTextFile()
+        : m_iFile(OpenNameless(TemporaryFolder())), m_pkFile(m_iFile < 0 ? nullptr : StreamOf(m_iFile, "w+"))
+    {
+    }
     ~CTextFile()
     {
         if (m_pkFile)

@@ -1,5 +1,5 @@
-// A worker is the program, started again, so it makes its handler from a description: lines of JSON. The first one says
-// what kind of run it is and holds its options, and each other line is a job of the run.
+// A worker is the program, started again, so it makes its handler from a description: lines of JSON. The
+// first one says what kind of run it is and holds its options, and each other line is a job of the run.
 
 #include "WorkerStart.h"
 
@@ -45,7 +45,8 @@ bool TakeShelf(const CJsonMembers& head, DraftShelfLink& link)
     uint64_t isTemporary = 0;
     uint64_t jobCount = 0;
     const bool has = head.TakeText("drafts", link.folder) && head.TakeText("draftMemory", link.memory) &&
-                     head.TakeCount("draftsAreTemporary", isTemporary) && head.TakeCount("draftJobs", jobCount);
+                     head.TakeCount("draftsAreTemporary", isTemporary) &&
+                     head.TakeCount("draftJobs", jobCount);
     link.isTemporary = isTemporary != 0;
     link.jobCount = jobCount;
     return has;
@@ -110,8 +111,8 @@ void ServeConversion(const CWorkerStart& start, const Task& task)
     ServeRun(start, task, run);
 }
 
-// The profile is selected as in the program, which has reported what there is to say about it. A profile with a file
-// is named by it.
+// The profile is selected as in the program, which has reported what there is to say about it. A profile with
+// a file is named by it.
 void ServeBatch(const CWorkerStart& start, Task& task)
 {
     const std::string profile = TextIn(task.head, "profile");
@@ -164,7 +165,8 @@ std::string CFileRun::Description() const
 {
     const auto* const batch = dynamic_cast<const CBatchRun*>(this);
     CJsonLine head;
-    head.Add("run", batch ? kBatchRun : kConversionRun).AddJson("options", OptionsJson(options_, kAllOptions));
+    head.Add("run", batch ? kBatchRun : kConversionRun)
+        .AddJson("options", OptionsJson(options_, kAllOptions));
     head.Add("stateFolder", m_kState.folder).Add("stateName", m_kState.name).Add("key", m_kCommonKey);
     if (batch && !batch->Conversion().IsAdapted())
         head.Add("profile", batch->Conversion().ProfilePath());

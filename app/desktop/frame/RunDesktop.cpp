@@ -3,7 +3,6 @@
 
 #include "RunDesktop.h"
 
-#include "CSystemPlatform.h"
 #include "CGaitConvertFrame.h"
 #include "CInstanceCounter.h"
 #include "CInstanceServer.h"
@@ -11,6 +10,7 @@
 #include "CMessageBox.h"
 #include "CPreviewWidget.h"
 #include "CSkin.h"
+#include "CSystemPlatform.h"
 #include "DesktopArguments.h"
 #include "Paths.h"
 #include "QuitOnSignals.h"

@@ -35,8 +35,8 @@ private:
 /// an instance replied; waits less than a second.
 bool RaiseFirstInstance(const std::string& path = {});
 
-/// Returns the absolute path of the socket, in a folder owned by the user, or the name of the user's pipe. Empty if
-/// there is no such folder.
+/// Returns the absolute path of the socket, in a folder owned by the user, or the name of the user's pipe.
+/// Empty if there is no such folder.
 QString InstanceSocketPath();
 
 } // namespace gw

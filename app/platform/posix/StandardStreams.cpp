@@ -46,7 +46,8 @@ bool IsStandardOutputPath(const std::string& path)
 
 std::string_view ForbiddenInFileNames()
 {
-    return {"/\\\0", 3}; // the second is allowed, but a file with it in its name cannot be moved to other systems
+    return {"/\\\0",
+            3}; // the second is allowed, but a file with it in its name cannot be moved to other systems
 }
 
 } // namespace gw

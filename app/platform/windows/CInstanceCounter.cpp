@@ -17,8 +17,8 @@ static_assert(SharedCount::is_always_lock_free); // otherwise the lock would be 
 // Returns null without shared memory. The handle is closed: the view keeps the memory.
 int32_t* MapCount(const std::string& sharedName)
 {
-    const HANDLE mapping = CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE, 0, sizeof(int32_t),
-                                              WideText(sharedName).c_str());
+    const HANDLE mapping = CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE, 0,
+                                              sizeof(int32_t), WideText(sharedName).c_str());
     if (!mapping)
         return nullptr;
     void* const memory = MapViewOfFile(mapping, FILE_MAP_WRITE, 0, 0, sizeof(int32_t));

@@ -25,7 +25,8 @@ std::string ReadText(HKEY root, const std::wstring& key, const std::wstring& nam
     constexpr DWORD kTexts = RRF_RT_REG_SZ | RRF_RT_REG_EXPAND_SZ;
     std::wstring text;
     DWORD byteCount = 0;
-    LSTATUS status = RegGetValueW(root, key.c_str(), name.c_str(), kTexts | view, nullptr, nullptr, &byteCount);
+    LSTATUS status =
+        RegGetValueW(root, key.c_str(), name.c_str(), kTexts | view, nullptr, nullptr, &byteCount);
     while (status == ERROR_SUCCESS || status == ERROR_MORE_DATA)
     {
         text.resize(byteCount / sizeof(wchar_t) + 1);
@@ -57,8 +58,8 @@ bool CRegistryPlatform::WriteSetting(const std::string& key, const std::string& 
 {
     const std::wstring text = WideText(value);
     const auto byteCount = static_cast<DWORD>((text.size() + 1) * sizeof(wchar_t));
-    return m_bWriting && RegSetKeyValueW(HKEY_CURRENT_USER, kSettings, WideText(key).c_str(), REG_SZ, text.c_str(),
-                                         byteCount) == ERROR_SUCCESS;
+    return m_bWriting && RegSetKeyValueW(HKEY_CURRENT_USER, kSettings, WideText(key).c_str(), REG_SZ,
+                                         text.c_str(), byteCount) == ERROR_SUCCESS;
 }
 
 std::string CRegistryPlatform::ReadHostKey(const std::string& keyPath, const std::string& valueName) const

@@ -4,13 +4,14 @@
 
 namespace gw {
 
-/// The platform for Windows: settings in the user's registry below Software\Tessarine\Gaitwright\Settings, or in
-/// the machine's for values that the user has not set; the host product's keys in the machine's registry; known
-/// folders.
+/// The platform for Windows: settings in the user's registry below Software\Tessarine\Gaitwright\Settings, or
+/// in the machine's for values that the user has not set; the host product's keys in the machine's registry;
+/// known folders.
 class CRegistryPlatform : public CPlatform
 {
 public:
-    /// `dataFolder`, unless empty, replaces the program's data folder (the executable's or an installation's).
+    /// `dataFolder`, unless empty, replaces the program's data folder (the executable's or an
+    /// installation's).
     explicit CRegistryPlatform(EPlatformWriting writing, std::string dataFolder = {});
 
     std::string ReadSetting(const std::string& key) const override;

@@ -68,7 +68,8 @@ bool IsStreamPath(const std::string& path)
     if (path.starts_with(R"(\\.\)"))
         return true;
     const PathParts parts = SplitPath(path);
-    return std::ranges::any_of(kDevices, [&](std::string_view name) { return EqualNoCase(parts.stem, name); });
+    return std::ranges::any_of(kDevices,
+                               [&](std::string_view name) { return EqualNoCase(parts.stem, name); });
 }
 
 bool IsStandardOutputPath(const std::string& path)

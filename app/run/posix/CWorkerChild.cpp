@@ -1,5 +1,6 @@
-// The program's side of a worker process: fork, socket, and the collection of its output. A worker writes to files in
-// memory rather than pipes, so it can never block on a full pipe, and its last output survives its death.
+// The program's side of a worker process: fork, socket, and the collection of its output. A worker writes to
+// files in memory rather than pipes, so it can never block on a full pipe, and its last output survives its
+// death.
 
 #include "CWorkerChild.h"
 

@@ -11,13 +11,13 @@
 
 namespace gw {
 
-/// A worker process, as the system sees it: a copy of the program that is connected by a socket. Its output goes to
-/// files in memory that outlive it.
+/// A worker process, as the system sees it: a copy of the program that is connected by a socket. Its output
+/// goes to files in memory that outlive it.
 class CWorkerChild
 {
 public:
-    /// Starts a process for a handler. Closes the sockets of the other workers in it; otherwise they would not
-    /// notice the end of the program. Returns null if the system cannot start one.
+    /// Starts a process for a handler. Closes the sockets of the other workers in it; otherwise they would
+    /// not notice the end of the program. Returns null if the system cannot start one.
     static std::unique_ptr<CWorkerChild> Start(CJobHandler& handler, ECommit commit,
                                                std::span<CWorkerChild* const> others);
     /// Waits for the process, which ends when its connection is closed; kills it if that takes more than some

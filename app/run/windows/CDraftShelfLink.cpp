@@ -11,7 +11,10 @@ CDraftShelf::CDraftShelf(const DraftShelfLink& link)
 
 DraftShelfLink CDraftShelf::Link() const
 {
-    return {.folder = m_kFolder, .isTemporary = m_bTemporary, .memory = m_kMemory.Name(), .jobCount = m_uiJobCount};
+    return {.folder = m_kFolder,
+            .isTemporary = m_bTemporary,
+            .memory = m_kMemory.Name(),
+            .jobCount = m_uiJobCount};
 }
 
 } // namespace gw

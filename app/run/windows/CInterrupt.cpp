@@ -12,8 +12,8 @@ constexpr DWORD kLongerThanTheSystemWaits = 60'000;
 
 std::atomic<int> requests = 0;
 
-// Runs in a thread of its own. When the console closes or the session ends, the system ends the process as soon as
-// this returns, and after some seconds in any case: that counts as an urgent request.
+// Runs in a thread of its own. When the console closes or the session ends, the system ends the process as
+// soon as this returns, and after some seconds in any case: that counts as an urgent request.
 BOOL WINAPI TakeRequest(DWORD kind)
 {
     const bool isUrgent = kind != CTRL_C_EVENT && kind != CTRL_BREAK_EVENT;

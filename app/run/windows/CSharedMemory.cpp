@@ -16,8 +16,9 @@ std::string NewName()
 
 HANDLE Create(const std::string& name, uint64_t byteCount)
 {
-    return CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE, static_cast<DWORD>(byteCount >> 32),
-                              static_cast<DWORD>(byteCount), WideText(name).c_str());
+    return CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE,
+                              static_cast<DWORD>(byteCount >> 32), static_cast<DWORD>(byteCount),
+                              WideText(name).c_str());
 }
 
 void* Map(HANDLE memory)

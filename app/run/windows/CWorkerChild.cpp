@@ -1,6 +1,6 @@
-// The program's side of a worker process. The system cannot copy a process, so the program is started again with an
-// argument that names the handles it inherits. A worker writes to files rather than pipes, so it can never block on a
-// full pipe, and its last output survives its death.
+// The program's side of a worker process. The system cannot copy a process, so the program is started again
+// with an argument that names the handles it inherits. A worker writes to files rather than pipes, so it can
+// never block on a full pipe, and its last output survives its death.
 
 #include "CWorkerChild.h"
 
@@ -39,7 +39,8 @@ HANDLE ReplyEvent()
     return event;
 }
 
-// A copy of a handle that a started process may inherit; the process closes it by its end, and this one at once.
+// A copy of a handle that a started process may inherit; the process closes it by its end, and this one at
+// once.
 class CInherited
 {
 public:
@@ -55,14 +56,14 @@ private:
     CHandle m_kCopy;
 };
 
-// Creates a file that is gone when its last handle is closed. It stays in memory unless that is short. Returns null if
-// that fails.
+// Creates a file that is gone when its last handle is closed. It stays in memory unless that is short.
+// Returns null if that fails.
 HANDLE CreateMemory()
 {
     const std::string path = PrivateName(TemporaryFolder(), ".tmp");
     const HANDLE file =
-        CreateFileW(WidePath(path).c_str(), GENERIC_READ | GENERIC_WRITE | DELETE, kShareAll, nullptr, CREATE_NEW,
-                    FILE_ATTRIBUTE_TEMPORARY | FILE_FLAG_DELETE_ON_CLOSE, nullptr);
+        CreateFileW(WidePath(path).c_str(), GENERIC_READ | GENERIC_WRITE | DELETE, kShareAll, nullptr,
+                    CREATE_NEW, FILE_ATTRIBUTE_TEMPORARY | FILE_FLAG_DELETE_ON_CLOSE, nullptr);
     return file == INVALID_HANDLE_VALUE ? nullptr : file;
 }
 
@@ -201,8 +202,9 @@ bool CWorkerChild::StartProcess(const CWorkerStart& start)
         inherited[i] = std::make_unique<CInherited>(start.handles[i], kAccess[i]);
         copies.handles[i] = handles.emplace_back(inherited[i]->Get());
     }
-    const CHandle nothing(CreateFileW(L"NUL", GENERIC_READ | GENERIC_WRITE, FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr,
-                                      OPEN_EXISTING, 0, nullptr));
+    const CHandle nothing(CreateFileW(L"NUL", GENERIC_READ | GENERIC_WRITE,
+                                      FILE_SHARE_READ | FILE_SHARE_WRITE, nullptr, OPEN_EXISTING, 0,
+                                      nullptr));
     const CInherited standard(nothing.Get(), 0);
     handles.push_back(standard.Get());
 
@@ -215,12 +217,14 @@ bool CWorkerChild::StartProcess(const CWorkerStart& start)
     startup.StartupInfo.hStdError = standard.Get();
     startup.lpAttributeList = attributes.Get();
     const std::wstring program = ProgramPath();
-    std::wstring command = L"\"" + program + L"\" " + WideText(kWorkerArgument) + L' ' + WideText(copies.Text());
-    // In a group of its own, Ctrl-C does not reach it before it can ignore that. It starts when it is in the job.
+    std::wstring command =
+        L"\"" + program + L"\" " + WideText(kWorkerArgument) + L' ' + WideText(copies.Text());
+    // In a group of its own, Ctrl-C does not reach it before it can ignore that. It starts when it is in the
+    // job.
     constexpr DWORD kFlags = CREATE_SUSPENDED | CREATE_NEW_PROCESS_GROUP | EXTENDED_STARTUPINFO_PRESENT;
     PROCESS_INFORMATION process = {};
-    if (!attributes.IsGood() || !CreateProcessW(program.c_str(), command.data(), nullptr, nullptr, TRUE, kFlags, nullptr,
-                                                nullptr, &startup.StartupInfo, &process))
+    if (!attributes.IsGood() || !CreateProcessW(program.c_str(), command.data(), nullptr, nullptr, TRUE,
+                                                kFlags, nullptr, nullptr, &startup.StartupInfo, &process))
         return false;
     *m_kProcess.Place() = process.hProcess;
     const CHandle thread(process.hThread);

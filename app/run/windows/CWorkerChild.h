@@ -12,8 +12,8 @@ namespace gw {
 
 class CWorkerStart;
 
-/// A worker process, as the system sees it: the program, started again, and connected by pipes. Its output goes to
-/// temporary files that outlive it. All workers end with the program.
+/// A worker process, as the system sees it: the program, started again, and connected by pipes. Its output
+/// goes to temporary files that outlive it. All workers end with the program.
 class CWorkerChild
 {
 public:

@@ -4,7 +4,8 @@
 
 namespace gw {
 
-// A message is far smaller than the buffer of a pipe, and at most one is on its way, so it always arrives whole.
+// A message is far smaller than the buffer of a pipe, and at most one is on its way, so it always arrives
+// whole.
 bool CWorkerLink::Receive(WorkerOrder& order)
 {
     DWORD count = 0;

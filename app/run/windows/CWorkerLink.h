@@ -4,8 +4,8 @@
 
 namespace gw {
 
-/// A worker's end of the connection to its program: a pipe for each direction, and an event that the program waits for.
-/// The handles are those of the system.
+/// A worker's end of the connection to its program: a pipe for each direction, and an event that the program
+/// waits for. The handles are those of the system.
 class CWorkerLink
 {
 public:

@@ -1,5 +1,5 @@
-// The worker's side of its start. Until it serves, its standard streams lead nowhere, so that making the handler again
-// repeats no message of the program.
+// The worker's side of its start. Until it serves, its standard streams lead nowhere, so that making the
+// handler again repeats no message of the program.
 
 #include "CWorkerStart.h"
 
@@ -79,7 +79,8 @@ std::string CWorkerStart::Description() const
 void CWorkerStart::Serve(CJobHandler& handler) const
 {
     CInterrupt::Ignore();
-    SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX | SEM_NOOPENFILEERRORBOX); // the program reports it
+    SetErrorMode(SEM_FAILCRITICALERRORS | SEM_NOGPFAULTERRORBOX |
+                 SEM_NOOPENFILEERRORBOX); // the program reports it
     std::FILE* const record = _fdopen(DescriptorOf(handles[Record]), "ab");
     if (record && Redirect(stdout, handles[Output]) && Redirect(stderr, handles[Words]))
         CWorkerLoop(handler, {handles[Orders], handles[Replies], handles[Event]}, record, commit).Run();

@@ -10,7 +10,8 @@ namespace gw {
 /// The program's argument that makes it a worker; a CWorkerStart as text follows.
 inline constexpr const char* kWorkerArgument = "--worker";
 
-/// What a program gets that starts as a worker: handles that it has inherited, and the description of its handler.
+/// What a program gets that starts as a worker: handles that it has inherited, and the description of its
+/// handler.
 class CWorkerStart
 {
 public:
