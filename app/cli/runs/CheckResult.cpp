@@ -4,6 +4,7 @@
 #include "ConvertFile.h"
 #include "HTRPose.h"
 #include "MeasureResult.h"
+#include "NativePath.h"
 #include "Paths.h"
 #include "ShellOptions.h"
 
@@ -26,12 +27,15 @@ std::string ModelLink(const std::string& page, const std::string& result)
 {
     std::error_code error;
     const std::filesystem::path folder =
-        std::filesystem::absolute(page, error).lexically_normal().parent_path();
-    std::string link = std::filesystem::absolute(result, error).lexically_normal().lexically_relative(folder);
+        std::filesystem::absolute(NativePath(page), error).lexically_normal().parent_path();
+    std::string link = std::filesystem::absolute(NativePath(result), error)
+                           .lexically_normal()
+                           .lexically_relative(folder)
+                           .generic_string();
     std::string beside = SplitPath(result).stem + ".glb";
     if (HasExtension(result, ".glb") && !link.starts_with(".."))
         return link;
-    return FileExists(folder / beside) ? beside : std::string();
+    return FileExists(PathText(folder / beside)) ? beside : std::string();
 }
 
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, const std::string& profilePath)
