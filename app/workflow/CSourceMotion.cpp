@@ -8,7 +8,7 @@ namespace gw {
 
 CSourceMotion::CSourceMotion()
 {
-    m_kMotion.boneMeshes = EBoneMeshes::Empty; // only a target's lowest point is put on the floor
+    m_kMotion.boneMeshes = EBoneMeshes::Empty; // a source is not shown
 }
 
 void CSourceMotion::Select(const std::string& clip, float rate)

@@ -27,6 +27,16 @@ void COrnHTMLPage::WriteTo(std::FILE* file) const
         page.WriteTo(file);
 }
 
+std::string COrnHTMLPage::Text() const
+{
+    std::string text;
+    for (const std::string& line : m_kLines)
+        text.append(line).append("\n");
+    for (const COrnHTMLPage& page : m_kPages)
+        text += page.Text();
+    return text;
+}
+
 void COrnHTMLPage::AddFormat(const char* format, ...)
 {
     thread_local std::string buffer; // as long as the longest line

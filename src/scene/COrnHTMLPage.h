@@ -19,6 +19,9 @@ public:
     /// Prints the lines with their line ends, then the nested pages.
     virtual void WriteTo(std::FILE* file) const;
 
+    /// Returns what WriteTo prints.
+    std::string Text() const;
+
     void AddLine(std::string line) { m_kLines.push_back(std::move(line)); }
     /// Adds a line formatted as by printf.
     [[gnu::format(printf, 2, 3)]] void AddFormat(const char* format, ...);

@@ -9,8 +9,6 @@
 #include "TreeViewScript.h"
 
 #include <algorithm>
-#include <cstdio>
-#include <cstdlib>
 #include <string_view>
 
 namespace gw {
@@ -29,20 +27,6 @@ struct LinkRow
 };
 constexpr LinkRow kTreeLink{"\", \"OrnHTML", "\", \"#OrnHTML", ".htm target=mainFrame\"", " target=_self\""};
 constexpr LinkRow kPageLink{R"(HREF=".\OrnHTML)", R"(HREF="#OrnHTML)", ".htm\"", "\""};
-
-std::string TextOf(const COrnHTMLPage& page)
-{
-    char* text = nullptr;
-    size_t size = 0;
-    std::FILE* const stream = open_memstream(&text, &size);
-    if (!stream)
-        return {};
-    page.WriteTo(stream);
-    std::fclose(stream);
-    std::string copy(text, size);
-    std::free(text);
-    return copy;
-}
 
 std::string WithLinks(std::string_view text, const LinkRow& row)
 {
@@ -73,7 +57,7 @@ std::string_view ScriptOf(std::string_view page)
 
 bool CSinglePageDump::Write(const COrnHTMLPage& page, const std::string& fileName)
 {
-    const std::string text = TextOf(page);
+    const std::string text = page.Text();
     if (fileName.starts_with("TreeView"))
         m_kTrees += WithLinks(ScriptOf(text), kTreeLink);
     if (!fileName.starts_with("OrnHTML") || text.empty())

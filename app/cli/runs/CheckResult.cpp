@@ -8,6 +8,7 @@
 #include "Paths.h"
 #include "ShellOptions.h"
 
+#include <algorithm>
 #include <filesystem>
 
 namespace gw {
@@ -26,16 +27,16 @@ ConvertedMotion MotionOf(const CFileConversion& conversion, const ConversionJob&
 std::string ModelLink(const std::string& page, const std::string& result)
 {
     std::error_code error;
-    const std::filesystem::path folder =
-        std::filesystem::absolute(NativePath(page), error).lexically_normal().parent_path();
-    std::string link = std::filesystem::absolute(NativePath(result), error)
-                           .lexically_normal()
-                           .lexically_relative(folder)
-                           .generic_string();
+    const auto full = [&](const std::string& path) {
+        return std::filesystem::absolute(NativePath(path), error).lexically_normal();
+    };
+    const std::filesystem::path folder = full(page).parent_path();
+    std::string link = PathText(full(result).lexically_relative(folder));
+    std::ranges::replace(link, kPathSeparator, '/'); // as links have it on every system
     std::string beside = SplitPath(result).stem + ".glb";
     if (HasExtension(result, ".glb") && !link.starts_with(".."))
         return link;
-    return FileExists(PathText(folder / beside)) ? beside : std::string();
+    return FileExists(PathText(folder / NativePath(beside))) ? beside : std::string();
 }
 
 std::optional<MeasuredConversion> MeasureMotion(const ConvertedMotion& motion, const std::string& profilePath)
