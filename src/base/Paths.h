@@ -53,6 +53,8 @@ std::string PathFrom(const std::string& folder, const std::string& relative);
 /// Returns the system's folder for temporary files with a trailing separator; empty if it does not exist.
 std::string TemporaryFolder();
 /// Returns the folder of the running program with a trailing separator, after following links to the program.
+std::string ProgramFolder();
+/// Returns the folder that the program's modules and data are found from: ProgramFolder, or the one that was set.
 std::string ExecutableFolder();
 /// Makes ExecutableFolder return another folder, for a library in a foreign program. Call it before any
 /// thread starts.

@@ -61,7 +61,7 @@ std::string TemporaryFolder()
     return error ? std::string() : WithSeparator(PathText(folder));
 }
 
-std::string ExecutableFolder()
+std::string ProgramFolder()
 {
     std::error_code error;
     fs::path program = fs::read_symlink("/proc/self/exe", error);

@@ -90,7 +90,7 @@ std::string TemporaryFolder()
     return {};
 }
 
-std::string ExecutableFolder()
+std::string ProgramFolder()
 {
     const std::wstring program =
         TextFrom([](wchar_t* text, DWORD size) { return GetModuleFileNameW(nullptr, text, size); });
