@@ -12,6 +12,7 @@ namespace {
 using Clock = std::chrono::steady_clock;
 
 constexpr DWORD kGlanceMilliseconds = 2;
+constexpr std::chrono::milliseconds kCallPeriod(100);
 constexpr DWORD kPatienceMilliseconds = 5000;
 constexpr DWORD kFirstCrashCode = 0xC0000000; // codes of the system for a process that it ended
 
@@ -83,11 +84,13 @@ bool Start(const std::string& program, const std::vector<std::string>& arguments
 }
 
 // Reads until the program closes its output. Returns Finished at that point.
-EChildEnd Collect(HANDLE pipe, const ChildLimits& limits, std::vector<std::byte>& output)
+EChildEnd Collect(HANDLE pipe, const ChildLimits& limits, std::vector<std::byte>& output,
+                  const std::function<void()>& wait)
 {
     const Clock::time_point end = Clock::now() + std::chrono::duration_cast<Clock::duration>(
                                                      std::chrono::duration<double>(limits.seconds));
     std::array<std::byte, 1 << 16> piece;
+    Clock::time_point nextCall = Clock::now() + kCallPeriod;
     while (Clock::now() < end)
     {
         DWORD count = 0;
@@ -96,6 +99,11 @@ EChildEnd Collect(HANDLE pipe, const ChildLimits& limits, std::vector<std::byte>
         if (count == 0)
         {
             Sleep(kGlanceMilliseconds);
+            if (wait && Clock::now() >= nextCall)
+            {
+                wait(); // if that throws, the job ends the program
+                nextCall = Clock::now() + kCallPeriod;
+            }
             continue;
         }
         if (!ReadFile(pipe, piece.data(), static_cast<DWORD>(piece.size()), &count, nullptr))
@@ -110,7 +118,8 @@ EChildEnd Collect(HANDLE pipe, const ChildLimits& limits, std::vector<std::byte>
 } // namespace
 
 EChildEnd RunChild(const std::string& program, const std::vector<std::string>& arguments,
-                   const ChildLimits& limits, std::vector<std::byte>& output)
+                   const ChildLimits& limits, std::vector<std::byte>& output,
+                   const std::function<void()>& wait)
 {
     output.clear();
     const CHandle job(CreateJobObjectW(nullptr, nullptr));
@@ -127,7 +136,7 @@ EChildEnd RunChild(const std::string& program, const std::vector<std::string>& a
         return EChildEnd::Missing;
     writeEnd.Close();
 
-    const EChildEnd end = Collect(pipe.Get(), limits, output);
+    const EChildEnd end = Collect(pipe.Get(), limits, output, wait);
     if (end != EChildEnd::Finished)
         return end; // the job's end is the program's
     DWORD code = 0;
