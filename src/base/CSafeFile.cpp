@@ -12,7 +12,9 @@
 #include "Paths.h"
 #include "SystemError.h"
 
+#include <mutex>
 #include <set>
+#include <thread>
 #include <utility>
 
 namespace gw {
@@ -32,10 +34,31 @@ bool IsThere(const std::string& path)
     return StatusOfLink(path, status);
 }
 
-// Of this thread, because a thread opens the file that it has asked to keep.
-std::set<std::string>& KeptPaths()
+// The files that are not to be replaced, each with the thread that asked: it is the one that opens the file.
+// One set for all threads, because without memory, the first use of a thread's own set would end the program.
+class CKeptPaths
 {
-    thread_local std::set<std::string> paths;
+public:
+    void Add(const std::string& path)
+    {
+        const std::scoped_lock lock(m_kMutex);
+        m_kPaths.emplace(std::this_thread::get_id(), path);
+    }
+    /// Returns whether the path was in the set.
+    bool Remove(const std::string& path)
+    {
+        const std::scoped_lock lock(m_kMutex);
+        return m_kPaths.erase({std::this_thread::get_id(), path}) > 0;
+    }
+
+private:
+    std::mutex m_kMutex;
+    std::set<std::pair<std::thread::id, std::string>> m_kPaths;
+};
+
+CKeptPaths& KeptPaths()
+{
+    static CKeptPaths paths;
     return paths;
 }
 
@@ -51,12 +74,12 @@ void CSafeFile::SetCommitGate(CommitGate gate)
 
 void CSafeFile::KeepExisting(const std::string& path)
 {
-    KeptPaths().insert(path);
+    KeptPaths().Add(path);
 }
 
 void CSafeFile::ReplaceExisting(const std::string& path)
 {
-    KeptPaths().erase(path);
+    KeptPaths().Remove(path);
 }
 
 CSafeFile::~CSafeFile()
@@ -69,7 +92,7 @@ bool CSafeFile::Open(const std::string& path)
     Discard();
     ForgetSystemError();
     m_eFailure = EFailure::WriteError;
-    m_bKeeps = KeptPaths().erase(path) > 0;
+    m_bKeeps = KeptPaths().Remove(path);
     if (m_bKeeps && IsThere(path))
     {
         m_eFailure = EFailure::Exists;

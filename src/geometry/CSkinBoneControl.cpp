@@ -9,6 +9,7 @@
 
 #include <algorithm>
 #include <iterator>
+#include <mutex>
 #include <utility>
 
 namespace gw {
@@ -17,13 +18,16 @@ const CRTTI CSkinBoneControl::ms_kRTTI{"CSkinBoneControl", &CControl::ms_kRTTI};
 
 namespace {
 
-// Scratch space for points; shared by all skins of a thread and kept between updates.
+// Scratch space for points: shared by all skins, by one at a time, and kept between updates.
+std::mutex s_kScratchMutex;
+std::vector<Vec3> s_kScratch;
+
+// Returns the scratch space with room for so many points, all zero. The caller holds its mutex.
 std::vector<Vec3>& Scratch(size_t count)
 {
-    thread_local std::vector<Vec3> scratch;
-    scratch.resize(std::max(scratch.size(), count));
-    std::ranges::fill(scratch, kVec3Zero);
-    return scratch;
+    s_kScratch.resize(std::max(s_kScratch.size(), count));
+    std::ranges::fill(s_kScratch, kVec3Zero);
+    return s_kScratch;
 }
 
 } // namespace
@@ -138,6 +142,7 @@ bool CSkinBoneControl::Update(float)
         target->UpdateWorldPoints();
     const std::span<Vec3> points = target->WorldXYZBuffer();
     const Mat4 toModel = Mat4InverseOrIdentity(target->m_kWorldMatrix);
+    const std::scoped_lock lock(s_kScratchMutex);
     std::vector<Vec3>& moved = Scratch(points.size());
     for (const Point& point : m_kPoints)
     {

@@ -39,13 +39,12 @@ std::string COrnHTMLPage::Text() const
 
 void COrnHTMLPage::AddFormat(const char* format, ...)
 {
-    thread_local std::string buffer; // as long as the longest line
     va_list arguments;
     va_start(arguments, format);
     va_list again;
     va_copy(again, arguments);
     const int length = std::vsnprintf(nullptr, 0, format, arguments);
-    buffer.resize(length < 0 ? 0 : static_cast<size_t>(length));
+    std::string buffer(length < 0 ? 0 : static_cast<size_t>(length), ' ');
     std::vsnprintf(buffer.data(), buffer.size() + 1, format, again);
     va_end(again);
     va_end(arguments);
