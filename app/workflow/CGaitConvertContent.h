@@ -268,7 +268,6 @@ private:
     // ProfileList.cpp
     void AddProfile(const std::string& path, int userData);
     void ChooseProfile();
-    void ForgetName(const std::string& name);
     void LoadSelectedProfile();
     bool ProfileFits(const std::string& path);
     bool IsListed(const std::string& name) const;

@@ -169,23 +169,13 @@ void CGaitConvertContent::DeleteSelectedProfile()
         const std::string name = *list.GetItemText(index);
         DeleteFile(FindProfilePath(name));
         list.DeleteItem(index);
-        ForgetName(name);
+        const auto listed =
+            std::ranges::find_if(m_kProfileNames, [&](const std::string& n) { return EqualNoCase(n, name); });
+        if (listed != m_kProfileNames.end())
+            m_kProfileNames.erase(listed);
         LoadSelectedProfile();
     }
     UpdateControls();
-}
-
-// Every refresh of the list has added the name once more. It stays taken only as often as it is still listed.
-void CGaitConvertContent::ForgetName(const std::string& name)
-{
-    const auto is = [&](const std::string& other) { return EqualNoCase(other, name); };
-    std::erase_if(m_kProfileNames, is);
-    const CCntComboExControl& list = *m_pkProfileCombo;
-    for (int index = 0; const std::string* text = list.GetItemText(index); ++index)
-    {
-        if (is(*text))
-            m_kProfileNames.push_back(*text);
-    }
 }
 
 void CGaitConvertContent::LoadSelectedProfile()

@@ -112,15 +112,6 @@ TEST_F(ContentTest, DeletingAProfile)
     EXPECT_FALSE(m_kWindow.m_kEnabled["del"]);
 }
 
-TEST_F(ContentTest, ADeletedNameIsFreeAgain)
-{
-    SelectProfile("Mine"); // which lists it a second time
-    m_kContent.ChildClick("del");
-    m_kContent.ProfileEditor()->EditField(kNameField, "Mine");
-    m_kContent.ProfileEditor()->LeaveField();
-    EXPECT_EQ(SelectedProfile(), "Mine");
-}
-
 TEST_F(ContentTest, PruningPassesOverWhatSlidesIntoAPlace)
 {
     for (const char* name : {"gone 1", "gone 2", "gone 3"})
