@@ -2,6 +2,7 @@
 
 #include "SystemConventions.h"
 
+#include <algorithm>
 #include <cmath>
 #include <cstring>
 #include <utility>
@@ -34,7 +35,7 @@ char* CLineWriter::MakeRoom(size_t byteCount)
 
 CLineWriter& CLineWriter::Text(std::string_view text)
 {
-    std::memcpy(Room(text.size()), text.data(), text.size());
+    std::ranges::copy(text, Room(text.size())); // of an empty text, the address may be null
     m_uiUsed += text.size();
     return *this;
 }
