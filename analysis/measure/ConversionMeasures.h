@@ -17,9 +17,9 @@ namespace gw {
 /// below that is not at the same position: toward the nearest mapped bone below, otherwise along the longest
 /// branch. If a bone branches into several mapped ones, the branch that deviates least sideways (x) in the
 /// result's rest pose is used: the spine for a hip, the neck for a chest. Source and result each use a joint
-/// on the path to the same mapped bone; a limb skips the source's twist joints and leads to that bone itself. If
-/// that bone's source is not below this bone's source (a collar that drives the torso), the source's direction
-/// starts where the two branch.
+/// on the path to the same mapped bone; a limb skips the source's twist joints and leads to that bone itself.
+/// If that bone's source is not below this bone's source (a collar that drives the torso), the source's
+/// direction starts where the two branch.
 struct BoneMeasures
 {
     std::string target;      ///< bone of the result

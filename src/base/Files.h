@@ -16,14 +16,14 @@ namespace gw {
 /// How a file is opened.
 enum class EOpen : uint8_t
 {
-    Read,       ///< does not wait for the other end of a pipe
-    ReadStream, ///< same, but waits
-    Existing,   ///< for reading and writing; fails for a link
-    New,        ///< for reading and writing; fails if anything has the name
-    Overwrite,  ///< for writing, with its old content cut; fails for a link
+    Read,        ///< does not wait for the other end of a pipe
+    ReadStream,  ///< same, but waits
+    Existing,    ///< for reading and writing; fails for a link
+    New,         ///< for reading and writing; fails if anything has the name
+    Overwrite,   ///< for writing, with its old content cut; fails for a link
     WriteStream, ///< for writing to a pipe or device; waits for its other end
-    Append,     ///< for reading, and for writing at its end; created if it does not exist
-    AppendAnew, ///< same, with its old content cut
+    Append,      ///< for reading, and for writing at its end; created if it does not exist
+    AppendAnew,  ///< same, with its old content cut
 };
 
 /// Opens a file. A new one gets the mode, minus the user's umask, where the system has modes. Returns a

@@ -54,7 +54,8 @@ std::string PathFrom(const std::string& folder, const std::string& relative);
 std::string TemporaryFolder();
 /// Returns the folder of the running program with a trailing separator, after following links to the program.
 std::string ProgramFolder();
-/// Returns the folder that the program's modules and data are found from: ProgramFolder, or the one that was set.
+/// Returns the folder that the program's modules and data are found from: ProgramFolder, or the one that was
+/// set.
 std::string ExecutableFolder();
 /// Makes ExecutableFolder return another folder, for a library in a foreign program. Call it before any
 /// thread starts.
