@@ -114,7 +114,7 @@ sources_to_lint() {
   else
     git log --format= --name-only -- '*.cpp' '*.h' | sed 's/\.h$/.cpp/' | awk '!seen[$0]++' |
       grep -Fxf <(git ls-files '*.cpp') | sed "$1q"
-  fi | grep -vE '^(bench/load_baseline|examples/)' || true
+  fi | grep -vE '^(bench/load_baseline|examples/)|/windows/' || true
 }
 
 # Each source is checked by itself: the linter reads the commands of the preset that joins none.

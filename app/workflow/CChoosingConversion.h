@@ -64,7 +64,7 @@ protected:
     /// otherwise.
     virtual bool UseDraft() { return false; }
     /// Sends the notice that no profile is used, and no draft.
-    virtual void NotifyOfNone(Notice notice) const { Notify(notice); }
+    virtual void NotifyOfNone(const Notice& notice) const { Notify(notice); }
 
 private:
     void ReadInstalled(const std::string& folder, bool stock);

@@ -105,18 +105,18 @@ bool CShellConversion::UseDraft()
 }
 
 // Adds the reason why no draft was used, or the option that allows one.
-void CShellConversion::NotifyOfNone(Notice notice) const
+void CShellConversion::NotifyOfNone(const Notice& notice) const
 {
     const std::string source = ShellWord(SourcePath());
     const std::string map = ShellWord(StemOf(SourcePath()) + ".prf");
-    notice = WithHelp(options_, std::move(notice));
+    Notice full = WithHelp(options_, notice);
     if (!m_kWhyNoDraft.empty())
-        notice.words += "\n  no draft was used: " + m_kWhyNoDraft;
+        full.words += "\n  no draft was used: " + m_kWhyNoDraft;
     else if (!options_.draft)
-        notice.words += "\n  --draft makes a profile for this skeleton";
+        full.words += "\n  --draft makes a profile for this skeleton";
     if (!options_.draft || m_bDraftUnsure)
-        notice.words += "; to check one first: gaitwright suggest " + source + " -o " + map;
-    Notify(notice);
+        full.words += "; to check one first: gaitwright suggest " + source + " -o " + map;
+    Notify(full);
 }
 
 } // namespace gw

@@ -42,7 +42,7 @@ public:
 
 protected:
     bool UseDraft() override;
-    void NotifyOfNone(Notice notice) const override;
+    void NotifyOfNone(const Notice& notice) const override;
 
 private:
     const ShellOptions& options_;
