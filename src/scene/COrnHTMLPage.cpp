@@ -41,14 +41,13 @@ void COrnHTMLPage::AddFormat(const char* format, ...)
 {
     va_list arguments;
     va_start(arguments, format);
-    va_list again;
-    va_copy(again, arguments);
     const int length = std::vsnprintf(nullptr, 0, format, arguments);
-    std::string buffer(length < 0 ? 0 : static_cast<size_t>(length), ' ');
-    std::vsnprintf(buffer.data(), buffer.size() + 1, format, again);
-    va_end(again);
     va_end(arguments);
-    AddLine(buffer);
+    std::string line(length < 0 ? 0 : static_cast<size_t>(length), ' ');
+    va_start(arguments, format);
+    std::vsnprintf(line.data(), line.size() + 1, format, arguments);
+    va_end(arguments);
+    AddLine(std::move(line));
 }
 
 } // namespace gw
