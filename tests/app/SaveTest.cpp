@@ -36,7 +36,7 @@ TEST_F(ContentTest, FilesAfterASave)
         m_kContent.SaveResult();
         std::string files;
         for (const auto& entry : std::filesystem::directory_iterator(folder.Path()))
-            files += entry.path().filename();
+            files += entry.path().filename().string();
         EXPECT_EQ(files, kept);
         EXPECT_EQ(m_kWindow.TakeCalls().back(), "show " + folder.Path(name));
         EXPECT_TRUE(m_kContent.IsSaved());
