@@ -1,6 +1,7 @@
 #pragma once
 
 #include <cstdint>
+#include <memory>
 #include <string>
 
 namespace gw {
@@ -14,7 +15,6 @@ class CInstanceCounter
 public:
     /// Processes that use the same name (without a slash) share the same word.
     explicit CInstanceCounter(const std::string& name = "gaitwright-instances");
-    ~CInstanceCounter();
     CInstanceCounter(const CInstanceCounter&) = delete;
     CInstanceCounter& operator=(const CInstanceCounter&) = delete;
 
@@ -31,8 +31,7 @@ public:
 
 private:
     std::string m_kSharedName;
-    int32_t m_iOwn = 0; // used if memory cannot be shared
-    int32_t* m_piCount; // instances minus 1: the system zeroes new memory
+    std::shared_ptr<int32_t> m_spiCount; // of instances; the system zeroes new memory
 };
 
 } // namespace gw

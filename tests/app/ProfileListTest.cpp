@@ -37,14 +37,17 @@ TEST_F(ContentTest, PathsByDisplayName)
         {"a name that nobody has", "Nobody", ""},
     };
     for (const auto& [what, name, path] : rows)
-        EXPECT_EQ(m_kContent.FindProfilePath(name), path.empty() ? "" : m_kFolder.Path(path)) << what;
+        EXPECT_EQ(WithSlashes(m_kContent.FindProfilePath(name)),
+                  path.empty() ? "" : WithSlashes(m_kFolder.Path(path)))
+            << what;
 }
 
 TEST_F(ContentTest, TheCustomFolderIsTheHostsOrTheDocuments)
 {
-    EXPECT_EQ(m_kContent.ProfileFile(""), m_kFolder.Path("docs/BVH Profile/"));
+    EXPECT_EQ(WithSlashes(m_kContent.ProfileFile("")), WithSlashes(m_kFolder.Path("docs/BVH Profile/")));
     m_kPlatform.m_kHostKeys["SOFTWARE\\Tessarine\\Kestro\\2.0/Custom Data"] = m_kFolder.Path("host");
-    EXPECT_EQ(m_kContent.ProfileFile("a.prf"), m_kFolder.Path("host/BVH Profile/a.prf"));
+    EXPECT_EQ(WithSlashes(m_kContent.ProfileFile("a.prf")),
+              WithSlashes(m_kFolder.Path("host/BVH Profile/a.prf")));
     EXPECT_TRUE(FolderExists(m_kFolder.Path("host/BVH Profile")));
 }
 

@@ -5,6 +5,7 @@
 #include "Paths.h"
 
 #include <filesystem>
+#include <gmock/gmock.h>
 #include <sys/stat.h>
 #include <tuple>
 
@@ -54,16 +55,17 @@ TEST_F(ContentTest, AnHtrBesideThePackageStaysAsItWas)
 
 TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
 {
+    using testing::AllOf, testing::EndsWith, testing::StartsWith;
     OpenAndConvert();
     const std::string path = Write("old.Kinetra", "old");
     chmod(path.c_str(), 0444);
     // next: a step that clears the title's report
-    const std::tuple<const char*, const char*, const char*, const char*> rows[] = {
-        {"a read-only package", "old.Kinetra", "Permission denied", "click convert"},
-        {"a folder that is not there", "none/out.Kinetra", "No such file or directory", "open gone.bvh"},
-        {"an HTR in such a folder", "none/out.htr", "No such file or directory", "open walk.bvh"},
+    const std::tuple<const char*, const char*, const char*> rows[] = {
+        {"a read-only package", "old.Kinetra", "click convert"},
+        {"a folder that is not there", "none/out.Kinetra", "open gone.bvh"},
+        {"an HTR in such a folder", "none/out.htr", "open walk.bvh"},
     };
-    for (const auto& [what, name, reason, next] : rows)
+    for (const auto& [what, name, next] : rows)
     {
         SCOPED_TRACE(what);
         EXPECT_EQ(SaveAs(name), 1);
@@ -71,9 +73,10 @@ TEST_F(ContentTest, AFailedSaveLeavesTheOldFileAndSaysSoInTheTitle)
         EXPECT_EQ(m_kWindow.TakeWords().find("write-error"), 0u);
         EXPECT_EQ(m_kWindow.m_kTitles.back().find("Gaitwright v2.0 - not saved: "), 0u)
             << m_kWindow.m_kTitles.back();
-        EXPECT_EQ(m_kWindow.m_kBoxes.back(), "Nothing was written.\n" + m_kFolder.Path(name) +
-                                                 ": the file cannot be written: " + reason +
-                                                 "\n\nShow the file in its folder?");
+        EXPECT_THAT(m_kWindow.m_kBoxes.back(),
+                    AllOf(StartsWith("Nothing was written.\n" + m_kFolder.Path(name) +
+                                     ": the file cannot be written: "),
+                          EndsWith("\n\nShow the file in its folder?")));
         Do(next);
         EXPECT_EQ(m_kWindow.m_kTitles.back(), "Gaitwright v2.0");
         m_kWindow.TakeCalls();

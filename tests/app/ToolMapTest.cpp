@@ -61,7 +61,7 @@ TEST_F(ToolTest, AMapComesBackAsItWasSaved)
     Click(kToolSaveMap, "saved.txt");
     EXPECT_EQ(m_kToolWindow.m_kAsked.defaultExtension, "txt");
     EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Map Files |*.txt;||");
-    EXPECT_EQ(Read("saved.txt"), Read("map.txt"));
+    EXPECT_EQ(ReadText(m_kFolder.Path("saved.txt")), Read("map.txt"));
     Click(kToolSaveMap, "none/saved.txt");
     EXPECT_EQ(m_kTool.Status().find("Not saved: saved.txt: "), 0u) << m_kTool.Status();
 }

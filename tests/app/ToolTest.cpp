@@ -176,7 +176,8 @@ TEST_F(ToolTest, TheResultIsSavedAtItsFixedScale)
     Click(kToolSaveResult, "out.htr");
     EXPECT_EQ(m_kToolWindow.m_kAsked.filter, "Anm Files (*.htr;*.bvh) |*.htr;*.bvh||");
     EXPECT_EQ(m_kTool.Status(), "Saved out.htr, every sixtieth frame");
-    EXPECT_NE(Read("out.htr").find("NumFrames 2\n"), std::string::npos) << "one frame of sixty";
+    EXPECT_NE(ReadText(m_kFolder.Path("out.htr")).find("NumFrames 2\n"), std::string::npos)
+        << "one frame of sixty";
 
     const std::tuple<const char*, const char*, const char*> refused[] = {
         {"data/base.htr", "out.bvh", "Not saved: out.bvh: results are written as .htr only"},

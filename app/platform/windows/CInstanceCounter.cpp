@@ -1,5 +1,5 @@
 // The counter of instances in named memory of the user's session. The system frees the memory with the last
-// process that has opened it, so a crash is forgotten once no instance is left.
+// counter that has opened it, so a crash is forgotten once no instance is left.
 
 #include "CInstanceCounter.h"
 
@@ -14,51 +14,51 @@ namespace {
 using SharedCount = std::atomic_ref<int32_t>;
 static_assert(SharedCount::is_always_lock_free); // otherwise the lock would be local to a process
 
-// Returns null without shared memory. The handle is closed: the view keeps the memory.
-int32_t* MapCount(const std::string& sharedName)
+// Returns memory of this process if it cannot be shared. The handle stays open: a view keeps the memory, but
+// not its name.
+std::shared_ptr<int32_t> MapCount(const std::string& sharedName)
 {
     const HANDLE mapping = CreateFileMappingW(INVALID_HANDLE_VALUE, nullptr, PAGE_READWRITE, 0,
                                               sizeof(int32_t), WideText(sharedName).c_str());
     if (!mapping)
-        return nullptr;
+        return std::make_shared<int32_t>(0);
     void* const memory = MapViewOfFile(mapping, FILE_MAP_WRITE, 0, 0, sizeof(int32_t));
-    CloseHandle(mapping);
-    return static_cast<int32_t*>(memory);
+    if (!memory)
+    {
+        CloseHandle(mapping);
+        return std::make_shared<int32_t>(0);
+    }
+    return {static_cast<int32_t*>(memory), [mapping](int32_t* count) {
+                UnmapViewOfFile(count);
+                CloseHandle(mapping);
+            }};
 }
 
 } // namespace
 
 CInstanceCounter::CInstanceCounter(const std::string& name)
-    : m_kSharedName("Local\\" + name), m_piCount(MapCount(m_kSharedName))
+    : m_kSharedName("Local\\" + name), m_spiCount(MapCount(m_kSharedName))
 {
-    if (!m_piCount)
-        m_piCount = &m_iOwn;
-}
-
-CInstanceCounter::~CInstanceCounter()
-{
-    if (m_piCount != &m_iOwn)
-        UnmapViewOfFile(m_piCount);
 }
 
 int32_t CInstanceCounter::Enter()
 {
-    return SharedCount(*m_piCount).fetch_add(1);
+    return SharedCount(*m_spiCount).fetch_add(1);
 }
 
 void CInstanceCounter::Leave()
 {
-    SharedCount(*m_piCount).fetch_sub(1);
+    SharedCount(*m_spiCount).fetch_sub(1);
 }
 
 void CInstanceCounter::Reset()
 {
-    SharedCount(*m_piCount).store(0);
+    SharedCount(*m_spiCount).store(0);
 }
 
 int32_t CInstanceCounter::Value() const
 {
-    return SharedCount(*m_piCount).load() - 1;
+    return SharedCount(*m_spiCount).load() - 1;
 }
 
 } // namespace gw

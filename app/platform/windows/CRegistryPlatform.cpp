@@ -19,20 +19,19 @@ constexpr const wchar_t* kSettings = L"Software\\Tessarine\\Gaitwright\\Settings
 constexpr DWORD kViews[] = {RRF_SUBKEY_WOW6464KEY, RRF_SUBKEY_WOW6432KEY};
 
 // Returns a text value with its variables expanded; empty if it is missing or not a text. Another program may
-// change it while it is read.
+// change it while it is read. Texts with variables become plain ones before their kind is checked.
 std::string ReadText(HKEY root, const std::wstring& key, const std::wstring& name, DWORD view)
 {
-    constexpr DWORD kTexts = RRF_RT_REG_SZ | RRF_RT_REG_EXPAND_SZ;
     std::wstring text;
     DWORD byteCount = 0;
     LSTATUS status =
-        RegGetValueW(root, key.c_str(), name.c_str(), kTexts | view, nullptr, nullptr, &byteCount);
+        RegGetValueW(root, key.c_str(), name.c_str(), RRF_RT_REG_SZ | view, nullptr, nullptr, &byteCount);
     while (status == ERROR_SUCCESS || status == ERROR_MORE_DATA)
     {
         text.resize(byteCount / sizeof(wchar_t) + 1);
         byteCount = static_cast<DWORD>(text.size() * sizeof(wchar_t));
-        status =
-            RegGetValueW(root, key.c_str(), name.c_str(), kTexts | view, nullptr, text.data(), &byteCount);
+        status = RegGetValueW(root, key.c_str(), name.c_str(), RRF_RT_REG_SZ | view, nullptr, text.data(),
+                              &byteCount);
         if (status == ERROR_SUCCESS)
             return NarrowText(text.c_str()); // up to the zero that ends it
     }

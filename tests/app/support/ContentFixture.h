@@ -6,8 +6,10 @@
 #include "CGaitConvertContent.h"
 #include "CPlatform.h"
 #include "MotionMarks.h"
+#include "SystemConventions.h"
 #include "TempFolder.h"
 
+#include <algorithm>
 #include <array>
 #include <functional>
 #include <gtest/gtest.h>
@@ -17,6 +19,13 @@
 #include <vector>
 
 namespace gw {
+
+/// Returns a path with slashes in place of the system's separators.
+inline std::string WithSlashes(std::string path)
+{
+    std::ranges::replace(path, kPathSeparator, '/');
+    return path;
+}
 
 /// A view that records what it shows.
 class CWatchedView : public CGLView
