@@ -8,11 +8,10 @@
 #include "FindBone.h"
 #include "HTRPose.h"
 #include "MeasureConversion.h"
+#include "StepBehind.h"
 
 #include <atomic>
 #include <new>
-#include <pthread.h>
-#include <sched.h>
 #include <thread>
 
 namespace gw {
@@ -38,15 +37,6 @@ std::vector<BonePair> PairsOf(const CMapRowTable& rows, CNode* source, CNode* re
             pairs.push_back(pair);
     }
     return pairs;
-}
-
-// Leaves the processor to everything else. Failing to do so only makes the measurement less modest.
-void StepBehind()
-{
-#if defined(SCHED_IDLE)
-    const sched_param none{};
-    pthread_setschedparam(pthread_self(), SCHED_IDLE, &none);
-#endif
 }
 
 } // namespace
