@@ -171,11 +171,12 @@ bool CMotionConversion::UseDraft()
     return true;
 }
 
-void CMotionConversion::NotifyOfNone(gw::Notice notice) const
+void CMotionConversion::NotifyOfNone(const gw::Notice& notice) const
 {
+    gw::Notice full = notice;
     if (!m_kWhyNoDraft.empty())
-        notice.words += "\n  no draft was used: " + m_kWhyNoDraft;
-    Notify(notice);
+        full.words += "\n  no draft was used: " + m_kWhyNoDraft;
+    Notify(full);
 }
 
 BoneMap::BoneMap(std::shared_ptr<const Content> content) noexcept : m_spContent(std::move(content)) {}

@@ -42,7 +42,7 @@ public:
 
 protected:
     bool UseDraft() override;
-    void NotifyOfNone(gw::Notice notice) const override;
+    void NotifyOfNone(const gw::Notice& notice) const override;
 
 private:
     CNotices m_kNotices;
