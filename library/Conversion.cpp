@@ -124,7 +124,7 @@ Outcome<Figures> Measure(const Access::ConversionContent& content)
     gw::PairBones(gw::TextOf(conversion.Profile()), source.root, result.root, pairs, missing);
     const auto measured = gw::MeasureResult(source, result, pairs);
     if (!measured)
-        return FailureOf("no-frames", "there are no frames to compare");
+        return FailureOf("no-frames", "the source or the result has no frames");
     return FiguresOf(*measured);
 }
 

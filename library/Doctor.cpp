@@ -1,47 +1,16 @@
 // Examinations of motion files, and repaired copies.
 
 #include "CFileExam.h"
-#include "CMotionFile.h"
-#include "COrrinStream.h"
 #include "CSourceFile.h"
+#include "ExamineFile.h"
 #include "Failures.h"
 #include "FindingWords.h"
 #include "Paths.h"
 #include "Writing.h"
 
-#include <filesystem>
-
 namespace gaitwright {
 
 namespace {
-
-// Containers have no poses to examine.
-void ExamineContainer(const std::string& path, gw::CFileExam& exam)
-{
-    gw::COrrinStream scene;
-    scene.SetPictureLimit(0);
-    scene.LoadFile(path, false);
-    exam.TakeRecord(path, scene.Record());
-}
-
-void ExamineMotion(const std::string& path, gw::CFileExam& exam)
-{
-    gw::CMotionFile motion;
-    const bool isLoaded = motion.Load(path);
-    exam.TakeRecord(path, motion.Record());
-    if (isLoaded)
-        exam.ExaminePoses(motion);
-}
-
-void Examine(const std::string& path, gw::CFileExam& exam)
-{
-    if (gw::HasExtension(path, ".bvh"))
-        exam.ExamineBVH(path);
-    else if (gw::HasExtension(path, ".orn") || gw::HasExtension(path, ".Kinetra"))
-        ExamineContainer(path, exam);
-    else
-        ExamineMotion(path, exam);
-}
 
 Finding FindingOf(const std::string& path, const gw::Finding& finding)
 {
@@ -77,20 +46,14 @@ Examination ExaminationOf(const std::string& path, const gw::CFileExam& exam)
     return examination;
 }
 
-bool IsSameFile(const std::string& a, const std::string& b)
-{
-    std::error_code error;
-    return std::filesystem::equivalent(a, b, error);
-}
-
 Outcome<Examination> MendFile(const std::string& path, const std::string& output, Existing existing)
 {
     if (!gw::HasExtension(path, ".bvh") || !gw::HasExtension(output, ".bvh"))
         return FailureOf("unknown-format", "a repaired .bvh is written from a .bvh");
-    if (IsSameFile(path, output))
+    if (gw::IsSameFile(path, output))
         return FailureOf("own-source", "a file is never repaired in place");
     gw::CFileExam exam;
-    Examine(path, exam);
+    gw::ExamineFile(path, exam);
     if (exam.Findings().HasFaults() && !exam.Findings().MendsAny())
         return FailureOf("not-fixable", "none of the faults can be repaired");
     const Outcome<void> written = WriteFile(output, existing, [&](const std::string& to) {
@@ -110,7 +73,7 @@ Outcome<Examination> Doctor(const std::string& path) noexcept
         if (!source.Open(path))
             return FailureOf(source.Failure());
         gw::CFileExam exam;
-        Examine(source.Path(), exam);
+        gw::ExamineFile(source.Path(), exam);
         return ExaminationOf(path, exam);
     });
 }

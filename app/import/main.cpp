@@ -136,7 +136,7 @@ std::string SharedName(const CSceneNodes& nodes, const aiAnimation* clip)
     return {};
 }
 
-// The library copies keys of short numbers as if they were long ones. What comes out are no rotations.
+// The library copies 16-bit keys as if they were floats. The results are not rotations.
 bool HasBadRotation(const aiAnimation* clip)
 {
     for (unsigned i = 0; clip && i < clip->mNumChannels; ++i)

@@ -42,7 +42,7 @@ public:
     /// Returns the file of a profile, given by a path ending in .prf, by its display name, or by any other
     /// path. Returns an empty path, after sending a notice of the reason, if none can be read.
     std::string ResolveProfile(const std::string& nameOrFile);
-    /// Uses the first stock profile that fits the source. Otherwise there is no profile yet.
+    /// Uses the first stock profile that fits the source. If neither fits, the profile is still to be chosen.
     void PickStockProfile();
     /// Selects the wanted profile, or the best one after PickStockProfile. Returns false, after sending a
     /// notice of the reason, if the profile cannot be read, if none fits the source, or if the best one is

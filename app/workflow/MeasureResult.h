@@ -15,7 +15,7 @@ class CFileConversion;
 MotionClip SourceClipOf(const CFileConversion& conversion);
 
 /// Compares a source with its result, whose tracks are as in its file (TakeWrittenPoses). Returns no value if
-/// there are no frames to compare.
+/// one of them has no frames.
 std::optional<MeasuredConversion> MeasureResult(const MotionClip& source, const MotionClip& result,
                                                 std::span<const BonePair> pairs);
 

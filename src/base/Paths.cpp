@@ -10,6 +10,7 @@
 #include "Text.h"
 
 #include <algorithm>
+#include <filesystem>
 #include <new>
 
 namespace gw {
@@ -56,6 +57,12 @@ bool FolderExists(const std::string& path)
 {
     FileStatus status;
     return StatusOf(path, status) && status.kind == EFileKind::Folder;
+}
+
+bool IsSameFile(const std::string& a, const std::string& b)
+{
+    std::error_code error;
+    return std::filesystem::equivalent(NativePath(a), NativePath(b), error);
 }
 
 bool IsLink(const std::string& path)

@@ -26,6 +26,8 @@ std::string WithSeparator(std::string folder);
 /// Returns whether a file exists. Paths are UTF-8. File system errors count as "no".
 bool FileExists(const std::string& path);
 bool FolderExists(const std::string& path);
+/// Returns whether two paths refer to the same existing file.
+bool IsSameFile(const std::string& a, const std::string& b);
 /// Returns whether a path is a symbolic link, whatever it points to.
 bool IsLink(const std::string& path);
 /// Returns whether a path is a folder itself, not a link to one.

@@ -163,7 +163,7 @@ TEST(CSafeFile, WhatMayNotBeReplacedIsRefused)
     const CTempFolder folder;
     WriteBytes(folder.Path("readonly"), "old");
     fs::permissions(folder.Path("readonly"), fs::perms::owner_read);
-    const auto link = [&](const char* target, const char* name) { // no name where there are no links
+    const auto link = [&](const char* target, const char* name) { // empty if the system cannot make links
         return MakeLink(target, folder.Path(name)) ? folder.Path(name) : std::string();
     };
     const std::string linked = link("readonly", "link");

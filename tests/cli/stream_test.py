@@ -78,7 +78,7 @@ class Streams(CliTest):
                 self.assertEqual(self.with_assets(*line.split()).code, code)
                 self.assertFalse([name for name in self.files() if name.split("/")[-1].startswith("-")])
 
-    @posix_only("there is no signal for a closed pipe")
+    @posix_only("Windows sends no signal when a pipe is closed")
     def test_a_reader_that_leaves_ends_the_program_and_leaves_no_file(self):
         self.environment["TMPDIR"] = str(self.folder)
         known = self.files()

@@ -4,9 +4,9 @@
 #include "CFileExam.h"
 #include "CJsonWriter.h"
 #include "COutputFile.h"
-#include "CSceneFile.h"
 #include "Color.h"
 #include "CommandTable.h"
+#include "ExamineFile.h"
 #include "FindingWords.h"
 #include "JsonStatus.h"
 #include "Notice.h"
@@ -24,25 +24,13 @@ namespace gw {
 
 namespace {
 
-void ExamineOther(const std::string& path, CFileExam& exam)
-{
-    CSceneFile file;
-    const bool read = file.Load(path);
-    exam.TakeRecord(path, file.Record());
-    if (read && !file.IsContainer())
-        exam.ExaminePoses(file.Motion());
-}
-
 // Returns false, after printing the reason, if there is nothing to examine.
 bool Examine(const std::string& path, CFileExam& exam)
 {
     CSourceFile source;
     if (!OpenSource(source, path, EPackage::Kept))
         return false;
-    if (HasExtension(source.Path(), ".bvh"))
-        exam.ExamineBVH(source.Path());
-    else
-        ExamineOther(source.Path(), exam);
+    ExamineFile(source.Path(), exam);
     return true;
 }
 

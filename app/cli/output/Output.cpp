@@ -63,12 +63,6 @@ bool CanListFolder(const ShellOptions& options, const std::string& path)
     return isReadable;
 }
 
-bool IsSameFile(const std::string& a, const std::string& b)
-{
-    std::error_code error;
-    return std::filesystem::equivalent(NativePath(a), NativePath(b), error);
-}
-
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path)
 {
     if (path == "-")

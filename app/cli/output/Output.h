@@ -20,8 +20,6 @@ Notice UnreadableFolder(const std::string& path);
 std::optional<Notice> WhyNoSource(const std::string& path);
 /// Returns whether the files of a folder can be listed; prints an error if not.
 bool CanListFolder(const ShellOptions& options, const std::string& path);
-/// Returns whether two paths refer to the same existing file.
-bool IsSameFile(const std::string& a, const std::string& b);
 /// Returns the reason why a command must not write a file: it exists and --force is missing, or it is a
 /// folder. No value if it may. Even then, saving without --force fails if the file appears in the meantime.
 std::optional<Notice> WhyNotWrite(const ShellOptions& options, const std::string& path);

@@ -36,7 +36,7 @@ private:
 bool RaiseFirstInstance(const std::string& path = {});
 
 /// Returns the absolute path of the socket, in a folder owned by the user, or the name of the user's pipe.
-/// Empty if there is no such folder.
+/// Returns an empty text if the user does not have such a folder.
 QString InstanceSocketPath();
 
 } // namespace gw

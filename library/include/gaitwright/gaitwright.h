@@ -75,7 +75,7 @@ struct Failure
 };
 
 /// Returns a failure as one line: "walk.bvh:12: an empty line where it is not allowed". Returns an empty text
-/// if there is no memory for it.
+/// when memory runs out.
 std::string Line(const Failure& failure) noexcept;
 
 /// A value, or the reason why there is none.

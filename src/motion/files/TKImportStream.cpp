@@ -155,7 +155,7 @@ bool TKImportStream::Check(const ImportedMotion& motion)
             return m_kRecord.Fail(EFailure::BadName, 0, joint.name);
         if (!HasFiniteKeys(joint))
             return m_kRecord.Fail(EFailure::NotImported, 0,
-                                  "the joint " + joint.name + " has a place that is no number");
+                                  "the joint " + joint.name + " has a position that is not a number");
     }
     return true;
 }

@@ -137,7 +137,7 @@ TEST(CSafeFile, SymbolicLinksAreFollowed)
         EXPECT_TRUE(fs::is_symlink(folder.Path(link))) << link;
 }
 
-// Programs that create, sweep and rename in one folder at the same time, as shards do.
+// Like the shards of a run, these programs create, sweep and rename files in one folder at the same time.
 TEST(PrivateNames, SweepersTakeNothingFromThoseWhoWrite)
 {
     const CTempFolder folder;
