@@ -117,8 +117,10 @@ bool CHTMLDump::Write(const COrnHTMLPage& page, const std::string& fileName)
 void CHTMLDump::Save(const COrnHTMLPage& page, const std::string& fileName)
 {
     ++m_uiPages;
-    if (!Write(page, fileName))
-        ++m_uiFailed;
+    if (Write(page, fileName))
+        return;
+    if (m_uiFailed++ == 0)
+        m_kFirstFailed = fileName;
 }
 
 void CHTMLDump::AddTables(COrnHTMLWriter& page, CObject& object)

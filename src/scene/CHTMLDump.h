@@ -39,6 +39,8 @@ public:
     size_t EntryCount() const { return m_uiEntries; }
     /// Returns the number of pages that could not be written.
     size_t FailedCount() const { return m_uiFailed; }
+    /// Returns the file name of the first page that could not be written; empty if all were.
+    const std::string& FirstFailed() const { return m_kFirstFailed; }
 
 protected:
     /// Writes a finished page into the folder. Returns false if that fails.
@@ -70,6 +72,7 @@ private:
     size_t m_uiSites = 0;
     size_t m_uiPages = 0;
     size_t m_uiFailed = 0;
+    std::string m_kFirstFailed;
 };
 
 } // namespace gw

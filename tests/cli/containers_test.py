@@ -111,6 +111,13 @@ class Containers(CliTest):
                         self.assertEqual(len(json.loads(result.out)["failures"]), 1)
             self.assertEqual(self.with_assets("convert", "bad.orn", "-o", "a.htr").code, FAILED)
 
+    def test_pages_do_not_replace_folders(self):
+        self.write("one.orn", Container().node(1, b"one", root=True).bytes)
+        (self.folder / "pages/OrnHTML0.htm").mkdir(parents=True)
+        result = self.run_program("dump", "one.orn", "--out-dir", "pages")
+        self.assertEqual(result.code, FAILED)
+        self.assert_words(result, ["pages/OrnHTML0.htm: the page cannot be written: a link, a folder"])
+
     def test_a_package_holds_the_file_and_what_was_said_of_it(self):
         rows = [("take.htr", 3), ("take.HTR", 3), ("take.cha", 1), ("take.chb", 2), ("take.txt", 0)]
         for name, code in rows:

@@ -74,8 +74,14 @@ EExit WritePages(const ShellOptions& options, const std::vector<CObject*>& roots
         return Fail(lost, "the pages may be lost after a power failure");
     if (dump.FailedCount() == 0)
         return EExit::Done;
-    return Fail(folder, std::to_string(dump.FailedCount()) + " of " + std::to_string(dump.PageCount()) +
-                            " pages cannot be written" + TakeSystemErrorWords());
+    std::string reason = TakeSystemErrorWords();
+    if (reason.empty())
+        reason = ": a link, a folder or a pipe has its name";
+    const std::string all = dump.FailedCount() == 1
+                                ? ""
+                                : "; in all, " + std::to_string(dump.FailedCount()) + " of " +
+                                      std::to_string(dump.PageCount()) + " pages failed";
+    return Fail(folder + dump.FirstFailed(), "the page cannot be written" + reason + all);
 }
 
 } // namespace
