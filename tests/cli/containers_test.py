@@ -78,14 +78,15 @@ class Containers(CliTest):
         told = json.loads(self.run_program("info", "circle.orn", "--json").out)["objects"][0]["fields"]
         self.assertEqual((told["XYZBuffer"], told["m_fRadius"]), ([[4, 5, 6]], 2))
 
-    def test_a_scene_that_ends_before_it_begins_is_not_converted(self):
+    def test_a_scene_is_converted_if_it_ends_after_it_begins(self):
         self.write("hip.prf", profile("Hip", [("hip", "LowerTorso")]))
-        for frames, code in ((3, DONE), (0, FAILED)):
-            self.write("scene.orn", one_bone_scene(frames))
-            result = self.with_assets("convert", "scene.orn", "-o", "%d.htr" % frames, "--profile", "hip.prf")
-            self.assertEqual(result.code, code, result.err)
-        self.assert_words(result, ["scene.orn", "no frames"])
-        self.assertEqual(self.files(), ["3.htr", "hip.prf", "scene.orn"])
+        for scene, words in ((one_bone_scene(), []), (one_bone_scene(0), ["no frames"]),
+                             (one_bone_scene(end=float("inf")), ["limit"])):
+            self.write("scene.orn", scene)
+            result = self.with_assets("convert", "scene.orn", "-o", "a.Kinetra", "--force", "--profile", "hip.prf")
+            self.assertEqual(result.code, FAILED if words else DONE, result.err)
+            self.assert_words(result, words and ["scene.orn"] + words)
+        self.assertEqual(self.files(), ["a.Kinetra", "hip.prf", "scene.orn"])
 
     def test_json_stays_json_whatever_a_file_holds(self):
         self.write("odd.orn", odd_numbers())

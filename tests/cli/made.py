@@ -122,16 +122,18 @@ class Container:
         body += struct.pack("<%dI" % len(children), *children)
         return self.record("CNode", number, name, (control, 0, 0), body, root)
 
-    def track(self, number, target, positions, frame_seconds=0.5, name="CKeyFrameControl"):
+    def track(self, number, target, positions, frame_seconds=0.5, name="CKeyFrameControl",
+              end=None):
         count = len(positions)
-        body = struct.pack("<IffffBII", 0, 0.0, count - 1.0, 0.0, frame_seconds, 1, target, 0)
+        end = count - 1.0 if end is None else end
+        body = struct.pack("<IffffBII", 0, 0.0, end, 0.0, frame_seconds, 1, target, 0)
         body += self.floats(IDENTITY) + struct.pack("<BII", 0, 0, count)
         body += b"".join(self.floats(p) for p in positions) + struct.pack("<II", 0, count)
         body += self.floats(range(count)) + struct.pack("<IIII", 0, 0, 0, 0)
         return self.record("CKeyframeControl", number, name, (0, 0, 0), body, False)
 
 
-def one_bone_scene(frames=3):
+def one_bone_scene(frames=3, end=None):
     """A bone that rises, frames of half a second; without frames it ends before it begins."""
     scene = Container().node(1, "hip", control=2, root=True)
-    return scene.track(2, 1, [(0, 90 + frame, 0) for frame in range(frames)]).bytes
+    return scene.track(2, 1, [(0, 90 + frame, 0) for frame in range(frames)], end=end).bytes

@@ -19,7 +19,7 @@ namespace {
 // Seven numbers of at least eight characters ("0.000000"), each with a separator, and a line end.
 constexpr double kLeastRowBytes = 7 * 9 + 1;
 
-// Returns the total number of digits of all row numbers from 1 to a count.
+// Returns the total number of digits of all row numbers from 1 to a finite count.
 double NumberBytes(double rowCount)
 {
     double bytes = 0.0;
@@ -38,10 +38,11 @@ std::optional<Notice> WhyTooLarge(const CFileConversion& conversion, const Conve
 {
     CNode* const skeleton = conversion.Result().restRoot.Get();
     const int rate = conversion.Profile().frameRate;
-    if (!HasExtension(job.output, ".Kinetra") || !skeleton || rate <= 0)
+    const double lastFrame = static_cast<double>(conversion.Timing().lastFrame);
+    // A scene's motion can have no end, which the conversion itself refuses.
+    if (!HasExtension(job.output, ".Kinetra") || !skeleton || rate <= 0 || !std::isfinite(lastFrame))
         return std::nullopt;
-    const double frames =
-        std::floor(std::max(static_cast<double>(conversion.Timing().lastFrame), -1.0)) + 1.0;
+    const double frames = std::floor(std::max(lastFrame, -1.0)) + 1.0;
     const double rows = std::floor(frames * kSavedRate / rate);
     const auto bones = static_cast<double>(NodesOf(*skeleton).size());
     const double bytes = bones * (rows * kLeastRowBytes + NumberBytes(rows));
