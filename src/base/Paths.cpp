@@ -25,19 +25,32 @@ std::string& SetFolder()
     return folder;
 }
 
+// Returns what follows the last separator.
+std::string_view NameIn(std::string_view path)
+{
+    return path.substr(path.find_last_of(kSeparators) + 1); // npos + 1 is 0
+}
+
+// Returns a name without its extension.
+std::string_view StemIn(std::string_view name)
+{
+    return name.substr(0, name.rfind('.'));
+}
+
 } // namespace
 
 PathParts SplitPath(std::string_view path)
 {
-    const size_t nameBegin = path.find_last_of(kSeparators) + 1; // npos + 1 is 0
-    const std::string_view name = path.substr(nameBegin);
-    const std::string_view stem = name.substr(0, name.rfind('.'));
-    return {std::string(path.substr(0, nameBegin)), std::string(stem), std::string(name.substr(stem.size()))};
+    const std::string_view name = NameIn(path);
+    const std::string_view stem = StemIn(name);
+    return {std::string(path.substr(0, path.size() - name.size())), std::string(stem),
+            std::string(name.substr(stem.size()))};
 }
 
 bool HasExtension(std::string_view path, std::string_view extension)
 {
-    return EqualNoCase(SplitPath(path).extension, extension);
+    const std::string_view name = NameIn(path);
+    return EqualNoCase(name.substr(StemIn(name).size()), extension);
 }
 
 std::string WithSeparator(std::string folder)

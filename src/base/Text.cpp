@@ -3,6 +3,7 @@
 #include "Text.h"
 
 #include <algorithm>
+#include <array>
 #include <cstddef>
 #include <cstdint>
 #include <numeric>
@@ -31,16 +32,17 @@ public:
     explicit constexpr CByteSet(std::string_view members)
     {
         for (const char c : members)
-            m_uiBits[Word(c)] |= Bit(c);
+            m_abHas[static_cast<unsigned char>(c)] = true;
     }
-    bool Has(char c) const { return (m_uiBits[Word(c)] & Bit(c)) != 0; }
+    bool Has(char c) const { return m_abHas[static_cast<unsigned char>(c)]; }
 
 private:
-    static constexpr size_t Word(char c) { return static_cast<unsigned char>(c) >> 6; }
-    static constexpr uint64_t Bit(char c) { return uint64_t{1} << (static_cast<unsigned char>(c) & 63); }
-
-    uint64_t m_uiBits[4] = {};
+    std::array<bool, 256> m_abHas = {};
 };
+
+// Up to half of a skeleton's text is indentation, so the compiler makes the usual sets.
+constexpr CByteSet kTokenDelimiterSet(kTokenDelimiters);
+constexpr CByteSet kBlankSet(kBlanks);
 
 // Checks the second byte of a UTF-8 sequence: rejects overlong forms, surrogates, and code points beyond the
 // last one.
@@ -109,14 +111,9 @@ size_t EditDistance(std::string_view a, std::string_view b)
     return row.back();
 }
 
-bool IsBlank(char c)
+std::string_view NextPart(std::string_view& rest, const CByteSet& separators)
 {
-    return c == ' ' || (c >= '\t' && c <= '\r');
-}
-
-template <class F>
-std::string_view NextPart(std::string_view& rest, F separates)
-{
+    const auto separates = [&](char c) { return separators.Has(c); };
     const auto begin = std::ranges::find_if_not(rest, separates);
     const auto end = std::find_if(begin, rest.end(), separates);
     const std::string_view token(begin, end);
@@ -150,14 +147,19 @@ std::string_view CutTrailing(std::string_view text)
     return text.substr(0, text.find_last_not_of(kBlanks) + 1);
 }
 
+std::string_view NextToken(std::string_view& rest)
+{
+    return NextPart(rest, kTokenDelimiterSet);
+}
+
 std::string_view NextToken(std::string_view& rest, std::string_view delimiters)
 {
-    return NextPart(rest, [set = CByteSet(delimiters)](char c) { return set.Has(c); });
+    return NextPart(rest, CByteSet(delimiters));
 }
 
 std::string_view NextWord(std::string_view& rest)
 {
-    return NextPart(rest, IsBlank);
+    return NextPart(rest, kBlankSet);
 }
 
 bool NextLine(std::string_view& rest, std::string_view& line)

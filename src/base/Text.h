@@ -18,7 +18,9 @@ std::string_view CutTrailing(std::string_view text);
 inline constexpr std::string_view kTokenDelimiters = " ,\t\n";
 /// Removes and returns the first token of a text; any run of delimiters separates. Empty if there are no
 /// more.
-std::string_view NextToken(std::string_view& rest, std::string_view delimiters = kTokenDelimiters);
+std::string_view NextToken(std::string_view& rest);
+/// The same with other delimiters.
+std::string_view NextToken(std::string_view& rest, std::string_view delimiters);
 /// Removes and returns the next token as sscanf's "%s" does, separated by blanks, tabs and line ends. Empty
 /// if there are no more.
 std::string_view NextWord(std::string_view& rest);
