@@ -31,7 +31,7 @@ class CPose
 public:
     CPose(const CJointTree& tree, size_t stance) : tree_(tree), m_uiStance(stance) {}
 
-    const Vec3& Place(int joint) const { return tree_.Stances().Place(m_uiStance, joint); }
+    Vec3 Place(int joint) const { return tree_.Stances().Place(m_uiStance, joint); }
     Vec3 Direction(int from, int to) const { return Vec3Normalized(Place(to) - Place(from)); }
     Vec3 Up(const LegsOfBody& body) const { return Direction(body.hip, body.chest); }
     Vec3 Sideways(const LegsOfBody& body) const { return Direction(body.legs[1].thigh, body.legs[0].thigh); }
@@ -41,7 +41,7 @@ public:
     {
         if (leg.ankle < 0)
             return kVec3Zero;
-        const Vec3& end = tree_.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
+        const Vec3 end = tree_.Stances().Tip(m_uiStance, leg.toe >= 0 ? leg.toe : leg.ankle);
         const Vec3 part = Across(Vec3Normalized(end - Place(leg.ankle)), Direction(leg.knee, leg.ankle));
         return Vec3Length(part) > kFootLeast ? Vec3Normalized(part) : kVec3Zero;
     }

@@ -73,9 +73,9 @@ double RiseOf(const CJointTree& tree, const FoundLimbs& limbs, int branch)
     double rise = 0.0;
     for (size_t stance = 0; stance < stances.Count(); ++stance)
     {
-        const Vec3& top = stances.Place(stance, tree.Parent(branch));
-        const Vec3& left = stances.Place(stance, limbs.legs.Lower(0));
-        const Vec3& right = stances.Place(stance, limbs.legs.Lower(1));
+        const Vec3 top = stances.Place(stance, tree.Parent(branch));
+        const Vec3 left = stances.Place(stance, limbs.legs.Lower(0));
+        const Vec3 right = stances.Place(stance, limbs.legs.Lower(1));
         const Vec3 up = Vec3Normalized(top - (left + right) * 0.5f);
         double highest = 0.0;
         for (const int joint : chain)

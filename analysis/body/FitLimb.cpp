@@ -86,7 +86,7 @@ public:
         return most;
     }
 
-    const Vec3& Place(size_t stance, size_t stop) const
+    Vec3 Place(size_t stance, size_t stop) const
     {
         const CStances& stances = tree_.Stances();
         return stop == LastStop() ? stances.Tip(stance, chain_.back()) : stances.Place(stance, chain_[stop]);

@@ -32,9 +32,9 @@ bool IsFrameTime(float frequency)
     return std::isfinite(frequency) && frequency > 0.0f;
 }
 
-CPoseSampler::CPoseSampler(float frequency)
-    : m_fFrequency(IsFrameTime(frequency) ? static_cast<double>(frequency) : 1.0)
+float TimeOfPose(double frame, float frequency)
 {
+    return static_cast<float>(frame / (IsFrameTime(frequency) ? static_cast<double>(frequency) : 1.0));
 }
 
 void CPoseSampler::Watch(CNode* node)
@@ -47,7 +47,7 @@ void CPoseSampler::Watch(CNode* node)
 
 void CPoseSampler::Pose(double frame)
 {
-    const auto time = static_cast<float>(frame / m_fFrequency);
+    const float time = TimeOfPose(frame, m_fFrequency);
     for (CNode* node : m_kNodes)
         node->CSpatial::UpdateTransform(time); // this node alone: UpdateScene would continue to its children
 }

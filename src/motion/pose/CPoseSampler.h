@@ -11,13 +11,16 @@ class CKeyframeControl;
 
 /// Returns whether a track's frequency is a usable frame time in seconds; odd files contain infinity and 0.
 bool IsFrameTime(float frequency);
+/// Returns the time of a frame, which can lie between two keys. `frequency` is the tracks' frame time in
+/// seconds; an unusable one counts as 1.
+float TimeOfPose(double frame, float frequency);
 
 /// Poses only the watched nodes of a motion's tree and their ancestors: no meshes, no bounds.
 class CPoseSampler
 {
 public:
-    /// `frequency` is the tracks' frame time in seconds; an unusable one counts as 1.
-    explicit CPoseSampler(float frequency);
+    /// `frequency` is that of TimeOfPose.
+    explicit CPoseSampler(float frequency) : m_fFrequency(frequency) {}
 
     /// Keeps a node's world matrix up to date from the next Pose on. Null is ignored.
     void Watch(CNode* node);
@@ -25,7 +28,7 @@ public:
     void Pose(double frame);
 
 private:
-    double m_fFrequency;
+    float m_fFrequency;
     std::vector<CNode*> m_kNodes; // parents before children
     std::unordered_set<const CNode*> m_kWatched;
 };

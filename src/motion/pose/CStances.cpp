@@ -1,10 +1,11 @@
 // Samples the rest pose and up to 16 frames at equal distances, fewer for very large skeletons, so that
-// memory is bounded. The tree is posed in place and restored afterwards.
+// memory is bounded. Joints are posed in place and restored afterwards.
 
 #include "CStances.h"
 
 #include "BoneMeshQueries.h"
 #include "CKeyframeControl.h"
+#include "CPoseSampler.h"
 #include "Skeleton.h"
 
 #include <algorithm>
@@ -14,7 +15,7 @@ namespace gw {
 namespace {
 
 constexpr size_t kMostFrames = 16;
-constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 31 MB with tips and rotations
+constexpr size_t kMostPlaces = size_t{1} << 19; // of all frames together: 34 MB
 
 const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
 {
@@ -27,76 +28,85 @@ const CKeyframeControl* FirstTrack(const std::vector<CNode*>& nodes)
     return nullptr;
 }
 
-// Restores the pose of a tree.
+// Restores the pose of a node.
 class CPoseKeeper
 {
 public:
-    explicit CPoseKeeper(const std::vector<CNode*>& nodes) : nodes_(nodes)
+    explicit CPoseKeeper(CNode& node) : node_(node), m_kLocal(node.m_kMatrix), m_kWorld(node.m_kWorldMatrix)
     {
-        for (const CNode* node : nodes)
-            m_kMatrices.emplace_back(node->m_kMatrix, node->m_kWorldMatrix);
     }
     CPoseKeeper(const CPoseKeeper&) = delete;
     CPoseKeeper& operator=(const CPoseKeeper&) = delete;
     ~CPoseKeeper()
     {
-        for (size_t i = 0; i < nodes_.size(); ++i)
-            std::tie(nodes_[i]->m_kMatrix, nodes_[i]->m_kWorldMatrix) = m_kMatrices[i];
+        node_.m_kMatrix = m_kLocal;
+        node_.m_kWorldMatrix = m_kWorld;
     }
 
 private:
-    const std::vector<CNode*>& nodes_;
-    std::vector<std::pair<Mat4, Mat4>> m_kMatrices;
+    CNode& node_;
+    Mat4 m_kLocal;
+    Mat4 m_kWorld;
 };
 
 } // namespace
 
-CStances::CStances(CNode& root)
+CStances::CStances(CNode& root) : m_kJoints(NodesOf(root)), m_kInFrames(m_kJoints.size())
 {
-    const std::vector<CNode*> joints = NodesOf(root);
-    for (const CNode* joint : joints)
+    m_kLocalTips.reserve(m_kJoints.size());
+    m_kRest.reserve(m_kJoints.size());
+    for (CNode* joint : m_kJoints)
+    {
+        const int parent = IndexOf(joint->GetParentNode());
+        m_kIndex.emplace(joint, static_cast<int>(m_kRest.size()));
         m_kLocalTips.push_back(joint->HasNoNodeChild() ? NodeBoneEnd(*joint) : kVec3Zero);
-    const CPoseKeeper keeper(joints);
-    const CKeyframeControl* const track = FirstTrack(joints);
-    tree_.emplace(joints, track ? track->m_fFrequency : 0.0f);
-    tree_->PoseRest();
-    AddPose();
+        m_kRest.push_back(parent < 0 ? RestLocal(*joint)
+                                     : RestLocal(*joint) * m_kRest[static_cast<size_t>(parent)]);
+    }
+    const CKeyframeControl* const track = FirstTrack(m_kJoints);
     if (!track)
         return;
     const size_t frames = track->m_kKeyTimes.size();
-    const size_t count = std::clamp<size_t>(kMostPlaces / joints.size(), 1, std::min(frames, kMostFrames));
+    const size_t count = std::clamp<size_t>(kMostPlaces / m_kJoints.size(), 1, std::min(frames, kMostFrames));
     for (size_t i = 0; i < count; ++i)
-    {
-        tree_->Pose(static_cast<double>(i * frames / count));
-        AddPose();
-    }
+        m_kTimes.push_back(TimeOfPose(static_cast<double>(i * frames / count), track->m_fFrequency));
 }
 
-void CStances::AddPose()
+int CStances::IndexOf(const CNode* joint) const
 {
-    Places& places = m_kPlaces.emplace_back();
-    Places& tips = m_kTips.emplace_back();
-    std::vector<Mat3>& axes = m_kAxes.emplace_back();
-    places.reserve(Joints().size());
-    tips.reserve(Joints().size());
-    axes.reserve(Joints().size());
-    for (size_t joint = 0; joint < Joints().size(); ++joint)
-    {
-        const Mat4& world = Joints()[joint]->m_kWorldMatrix;
-        places.push_back(world.Translation());
-        tips.push_back(TransformCoord(m_kLocalTips[joint], world));
-        Mat3& own = axes.emplace_back();
-        for (int row = 0; row < 3; ++row)
-            own.SetRow(row, world.Row(row));
-    }
+    const auto found = m_kIndex.find(joint);
+    return found == m_kIndex.end() ? -1 : found->second;
 }
 
-Mat3 CStances::Turn(size_t stance, int joint) const
+const Mat4& CStances::World(size_t stance, int joint) const
 {
-    Mat3 turn = m_kAxes[stance][static_cast<size_t>(joint)];
-    for (int row = 0; row < 3; ++row)
-        turn.SetRow(row, Vec3Normalized(turn.Row(row)));
-    return turn;
+    const auto index = static_cast<size_t>(joint);
+    if (stance == 0)
+        return m_kRest[index];
+    if (m_kInFrames[index].empty())
+        PoseInFrames(index);
+    return m_kInFrames[index][stance - 1];
+}
+
+// Poses the joint alone: its parent is given the world matrices that it has in the frames.
+void CStances::PoseInFrames(size_t joint) const
+{
+    CNode& node = *m_kJoints[joint];
+    CNode* const parent = node.GetParentNode();
+    const int above = IndexOf(parent);
+    const CPoseKeeper keeper(node);
+    const CPoseKeeper parentKeeper(above < 0 ? node : *parent);
+    node.m_kWorldMatrix = m_kRest[joint]; // two controls of one joint leave it as it is
+    std::vector<Mat4> worlds;
+    worlds.reserve(m_kTimes.size());
+    for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
+    {
+        if (above >= 0)
+            parent->m_kWorldMatrix = World(frame + 1, above);
+        node.CSpatial::UpdateTransform(m_kTimes[frame]);
+        worlds.push_back(node.m_kWorldMatrix);
+    }
+    m_kInFrames[joint] = std::move(worlds);
 }
 
 } // namespace gw
