@@ -3,7 +3,6 @@
 
 #include "NamePrefix.h"
 
-#include "JointWords.h"
 #include "Text.h"
 
 #include <algorithm>
@@ -25,9 +24,14 @@ bool IsWordCharacter(char c)
     return (c >= 'a' && c <= 'z') || (c >= '0' && c <= '9') || (c & 0x80) != 0;
 }
 
-bool IsUnderstood(std::string_view name)
+bool HasPrefix(std::string_view name, std::string_view prefix)
 {
-    return ReadJointName(name).word != EJointWord::None;
+    return name.size() > prefix.size() && EqualNoCase(name.substr(0, prefix.size()), prefix);
+}
+
+bool IsUnderstood(const JointName& name)
+{
+    return name.word != EJointWord::None;
 }
 
 // Returns the starts shared by enough names, in order. In sorted order, names with the same start are
@@ -61,32 +65,21 @@ std::vector<std::string> SharedStarts(std::span<const std::string_view> names)
 }
 
 // Counts the names that can be interpreted without a prefix; 0 as soon as there must be fewer than `least`.
-// Most candidates fail within the first few names.
-class CUnderstoodNames
+// Names that do not have it come first, because what they mean is known. Most candidates fail within the
+// first few of the others.
+size_t CountUnderstood(std::span<const std::string_view> names, std::span<const JointName> whole,
+                       std::string_view prefix, size_t least)
 {
-public:
-    explicit CUnderstoodNames(std::span<const std::string_view> names) : m_kNames(names)
+    size_t count = names.size();
+    for (size_t i = 0; i < names.size(); ++i)
+        count -= HasPrefix(names[i], prefix) || IsUnderstood(whole[i]) ? 0 : 1;
+    for (size_t i = 0; i < names.size() && count >= least; ++i)
     {
-        for (const std::string_view name : names)
-            m_kWhole.push_back(IsUnderstood(name));
+        if (HasPrefix(names[i], prefix) && !IsUnderstood(ReadJointName(WithoutPrefix(names[i], prefix))))
+            --count;
     }
-
-    size_t CountWhole() const { return static_cast<size_t>(std::ranges::count(m_kWhole, true)); }
-    size_t CountWithout(std::string_view prefix, size_t least) const
-    {
-        size_t count = m_kNames.size();
-        for (size_t i = 0; i < m_kNames.size() && count >= least; ++i)
-        {
-            const std::string_view rest = WithoutPrefix(m_kNames[i], prefix);
-            count -= (rest.size() == m_kNames[i].size() ? m_kWhole[i] : IsUnderstood(rest)) ? 0 : 1;
-        }
-        return count >= least ? count : 0;
-    }
-
-private:
-    std::span<const std::string_view> m_kNames;
-    std::vector<bool> m_kWhole;
-};
+    return count >= least ? count : 0;
+}
 
 } // namespace
 
@@ -96,18 +89,18 @@ std::string_view WithoutNamespace(std::string_view name)
     return colon == name.npos ? name : name.substr(colon + 1);
 }
 
-std::string FindNamePrefix(std::span<const std::string_view> names)
+std::string FindNamePrefix(std::span<const std::string_view> names, std::span<const JointName> whole)
 {
     names = names.first(std::min(names.size(), kNamesLooked));
-    const CUnderstoodNames understood(names);
+    whole = whole.first(names.size());
     std::string best;
-    size_t most = understood.CountWhole();
+    auto most = static_cast<size_t>(std::ranges::count_if(whole, IsUnderstood));
     for (std::string& start : SharedStarts(names))
     {
         // A separator between prefix and name belongs to the prefix.
         const bool closes = !best.empty() && start.starts_with(best) && !IsWordCharacter(start.back());
         const size_t least = closes ? most : most + 1;
-        const size_t count = understood.CountWithout(start, least);
+        const size_t count = CountUnderstood(names, whole, start, least);
         if (count < std::max<size_t>(least, 1))
             continue;
         most = count;
@@ -118,8 +111,7 @@ std::string FindNamePrefix(std::span<const std::string_view> names)
 
 std::string_view WithoutPrefix(std::string_view name, std::string_view prefix)
 {
-    const bool has = name.size() > prefix.size() && EqualNoCase(name.substr(0, prefix.size()), prefix);
-    return has ? name.substr(prefix.size()) : name;
+    return HasPrefix(name, prefix) ? name.substr(prefix.size()) : name;
 }
 
 } // namespace gw
