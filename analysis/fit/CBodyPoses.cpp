@@ -36,8 +36,8 @@ Vec3 Middle(const Vec3& a, const Vec3& b)
 
 } // namespace
 
-CBodyPoses::CBodyPoses(const CBodyMap& body, const BodyStance& rest)
-    : body_(body), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
+CBodyPoses::CBodyPoses(const CBodyMap& body, const BodyStance& rest, CRestWorlds& worlds)
+    : body_(body), worlds_(worlds), m_kSampler(FrameTimeOf(*body.Leg(EBodySide::Left).thigh))
 {
     if (!ShowsBody(rest))
         PlanFrames();
@@ -86,7 +86,7 @@ void CBodyPoses::Take(size_t pose)
 
 Mat4 CBodyPoses::World(const CNode& node) const
 {
-    return m_kFrames.empty() ? RestWorld(node) : node.m_kWorldMatrix;
+    return m_kFrames.empty() ? worlds_.Of(node) : node.m_kWorldMatrix;
 }
 
 Mat4 CBodyPoses::BoneWorld(const CNode& node) const

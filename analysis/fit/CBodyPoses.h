@@ -2,6 +2,7 @@
 
 #include "BodyStance.h"
 #include "CPoseSampler.h"
+#include "CRestWorlds.h"
 #include "Mat3.h"
 #include "Mat4.h"
 
@@ -16,7 +17,7 @@ class CBodyPoses
 {
 public:
     /// `body` must have both upper arms and both thighs.
-    CBodyPoses(const CBodyMap& body, const BodyStance& rest);
+    CBodyPoses(const CBodyMap& body, const BodyStance& rest, CRestWorlds& worlds);
     ~CBodyPoses();
     CBodyPoses(const CBodyPoses&) = delete;
     CBodyPoses& operator=(const CBodyPoses&) = delete;
@@ -48,6 +49,7 @@ private:
     void PlanFrames();
 
     const CBodyMap& body_;
+    CRestWorlds& worlds_;
     CPoseSampler m_kSampler;
     std::vector<double> m_kFrames; // empty for the rest pose
     std::vector<Kept> m_kKept;

@@ -83,10 +83,11 @@ void CheckSpine(const CBodyMap& body, const CNode* chest, ProfileVerdict& verdic
         verdict.doubts.push_back({EDoubt::SpineCut, NameOf(chest), NameOf(body.spine.back())});
 }
 
-void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
-                const BodyStance& rest, ProfileVerdict& verdict)
+void CheckTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body, SourceBody& source,
+                ProfileVerdict& verdict)
 {
-    const std::vector<RowTurn> turns = MeasureTurns(table, targets, body, rest);
+    const BodyStance rest = StanceIn(source.tree, 0, body);
+    const std::vector<RowTurn> turns = MeasureTurns(table, targets, body, rest, source.worlds);
     for (const RowTurn& turn : turns)
     {
         verdict.turn += turn.degrees / static_cast<double>(turns.size());
@@ -127,7 +128,7 @@ ProfileVerdict JudgeProfile(const CRetargeter& table, const CNodeNames& targets,
         verdict.doubts.push_back({doubt.kind, NameOf(JointAt(body, doubt.place)), {}});
     CompareNames(body, source.byNames, verdict);
     CheckSpine(body, table.SourceOf(targets.Find(kTorsoBone)), verdict);
-    CheckTurns(table, targets, body, StanceIn(source.tree, 0, body), verdict);
+    CheckTurns(table, targets, body, source, verdict);
     verdict.sureness = SurenessOf(verdict.doubts);
     return verdict;
 }

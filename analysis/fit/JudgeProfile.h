@@ -2,6 +2,7 @@
 
 #include "CBodyMap.h"
 #include "CJointTree.h"
+#include "CRestWorlds.h"
 #include "CheckBody.h"
 
 #include <cstddef>
@@ -48,8 +49,9 @@ struct SourceBody
     /// kept.
     const std::vector<BodyDoubt>& Check(const CBodyMap& body);
 
-    CBodyMap byNames; ///< found by joint names
-    CJointTree tree;  ///< positions and lengths
+    CBodyMap byNames;   ///< found by joint names
+    CJointTree tree;    ///< positions and lengths
+    CRestWorlds worlds; ///< of the source and the target
     CBodyMap checked;
     std::vector<BodyDoubt> doubts; ///< of the body that was checked last
 };

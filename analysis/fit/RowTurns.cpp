@@ -107,12 +107,13 @@ std::optional<Vec3> Direction(const Lead& lead, const CBodyPoses& poses, const M
     return TransformCoord(direction, Mat4Compose(toBody, kVec3Zero));
 }
 
-double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses, const Mat3& toBody)
+double Turn(const Lead& lead, const CRetargeter& table, const CBodyPoses& poses, const Mat4& targetAtRest,
+            const Mat3& toBody)
 {
     const Mat3 offset = OffsetRotation(table.OffsetAngles(lead.target), table.OffsetMatrix(lead.target));
     const Mat3 turned = offset * NormalizedRows(poses.BoneWorld(*lead.source)) * toBody;
     // At rest the target is aligned to the axes: left is x, up is y.
-    Mat3 wanted = NormalizedRows(RestWorld(*lead.target));
+    Mat3 wanted = NormalizedRows(targetAtRest);
     if (const std::optional<Vec3> direction = Direction(lead, poses, toBody))
         wanted = wanted * LeastSwing(wanted.Row(1), *direction);
     return AngleBetweenRotations(turned, wanted);
@@ -127,11 +128,11 @@ bool HasLimbs(const CBodyMap& body)
 } // namespace
 
 std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
-                                  const BodyStance& rest)
+                                  const BodyStance& rest, CRestWorlds& worlds)
 {
     if (!HasLimbs(body))
         return {};
-    CBodyPoses poses(body, rest);
+    CBodyPoses poses(body, rest, worlds);
     const std::vector<Lead> leads = FindLeads(table, targets);
     std::vector<RowTurn> turns;
     for (const Lead& lead : leads)
@@ -146,7 +147,8 @@ std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& ta
         poses.Take(pose);
         const Mat3 toBody = Mat3Transpose(poses.Axes());
         for (size_t i = 0; i < leads.size(); ++i)
-            turns[i].degrees += Turn(leads[i], table, poses, toBody) / static_cast<double>(poses.Count());
+            turns[i].degrees += Turn(leads[i], table, poses, worlds.Of(*leads[i].target), toBody) /
+                                static_cast<double>(poses.Count());
     }
     return turns;
 }

@@ -7,6 +7,7 @@
 namespace gw {
 
 class CNodeNames;
+class CRestWorlds;
 class CRetargeter;
 
 /// How far a row rotates its target bone away from the source's limb, about all axes.
@@ -20,8 +21,8 @@ struct RowTurn
 /// is swung by the smallest rotation to the source bone's direction; the difference is a misrotated bone.
 /// Uses the source's rest pose if it is a standing pose, otherwise some frames of its motion. Thighs and
 /// calves are not reported, because planting rotates them anyway; nothing is reported without both arms and
-/// legs. The source's nodes are restored.
+/// legs. The source's nodes are restored. `worlds` can be shared by all tables of one source and target.
 std::vector<RowTurn> MeasureTurns(const CRetargeter& table, const CNodeNames& targets, const CBodyMap& body,
-                                  const BodyStance& rest);
+                                  const BodyStance& rest, CRestWorlds& worlds);
 
 } // namespace gw
