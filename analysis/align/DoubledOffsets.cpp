@@ -4,6 +4,7 @@
 #include "DoubledOffsets.h"
 
 #include "Alignment.h"
+#include "CKeyframeControl.h"
 #include "CTreePoser.h"
 
 #include <algorithm>
@@ -44,6 +45,16 @@ private:
     int m_iFrames = 0;
 };
 
+// Returns whether a joint keeps its position relative to its parent in all poses. Most joints only rotate.
+bool IsStill(const CNode& joint)
+{
+    const CKeyframeControl* const track = TrackOf(joint);
+    if (track != joint.GetControl() || joint.GetModifier())
+        return false;
+    return !track || (!track->GetNext() && track->GetTarget() == &joint && track->m_uiParentMask == 0 &&
+                      track->m_kPositionKeys.Distinct().size() <= 1);
+}
+
 } // namespace
 
 std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
@@ -53,10 +64,17 @@ std::vector<bool> FindDoubled(CTreePoser& tree, const BodyMotion& motion)
     meters.reserve(joints.size());
     for (const CNode* joint : joints)
         meters.emplace_back(joint == motion.root ? kVec3Zero : RestLocal(*joint).Translation());
+    CPoseSampler moving(motion.frequency);
+    for (CNode* joint : joints)
+    {
+        if (!IsStill(*joint))
+            moving.Watch(joint);
+    }
+    tree.Pose(0);
     const int count = std::min(motion.frameCount, kDoubledSamples);
     for (int i = 0; i < count; ++i)
     {
-        tree.Pose(static_cast<int>(static_cast<int64_t>(motion.frameCount) * i / count));
+        moving.Pose(static_cast<int>(static_cast<int64_t>(motion.frameCount) * i / count));
         for (size_t joint = 0; joint < joints.size(); ++joint)
             meters[joint].Add(joints[joint]->m_kMatrix.Translation());
     }

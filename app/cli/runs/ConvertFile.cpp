@@ -35,7 +35,7 @@ constexpr const char* kOutcomeNames[] = {"converted", "would_convert", "skipped"
 // and not for scenes, whose pictures can have temporary files.
 void KeepUntilExit(CNode* root)
 {
-    static std::array<CNode*, 2> keptRoots{}; // reachable memory is not a leak
+    static std::array<CNode*, 3> keptRoots{}; // reachable memory is not a leak
     const auto free = std::ranges::find(keptRoots, nullptr);
     if (!root || free == keptRoots.end())
         return;
@@ -84,6 +84,8 @@ public:
             return;
         KeepUntilExit(m_kConversion.SourceRoot());
         KeepUntilExit(m_kConversion.Result().motionRoot.Get());
+        if (m_kConversion.DrivingRoot() != m_kConversion.SourceRoot()) // an aligned copy
+            KeepUntilExit(m_kConversion.DrivingRoot());
     }
 
     EConversion Run()
