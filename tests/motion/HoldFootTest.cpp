@@ -145,14 +145,21 @@ TEST(HoldFoot, JumpBeforeAContactDoesNotMoveThePivot)
 
 TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
 {
-    std::vector<float> free(240, 30.0f);
-    std::vector<float> landed(240, 0.0f);
-    std::fill(free.begin() + 60, free.begin() + 120, -40.0f);
-    std::fill(landed.begin() + 170, landed.begin() + 210, 1.0f);
-    const std::vector<double> heights = LandFoot(free, landed, kSeconds);
+    std::vector<SoleWish> wishes(330, SoleWish{30.0f, 0.0f, 0.0f, 0.0f});
+    for (size_t frame = 60; frame < 120; ++frame)
+        wishes[frame].free = -40.0f;
+    for (size_t frame = 170; frame < 210; ++frame)
+        wishes[frame].landed = 1.0f;
+    for (size_t frame = 250; frame < 290; ++frame)
+        wishes[frame] = {30.0f, 0.0f, 1.0f, 45.0f};
+    for (size_t frame = 290; frame < 330; ++frame)
+        wishes[frame] = {60.0f, 0.0f, 1.0f, 45.0f};
+    const std::vector<double> heights = LandFoot(wishes, kSeconds);
     EXPECT_NEAR(heights[10], 30.0, 1.0) << "on its free path";
     EXPECT_NEAR(heights[90], -40.0 / 16.0, 1.0) << "a sixteenth of a dip stays";
     EXPECT_NEAR(heights[190], 30.0 / 7.0, 1.5) << "nearly on the floor";
+    EXPECT_NEAR(heights[270], 30.0 + 15.0 * 4.0 / 5.0, 1.5) << "nearly as high as it should be aloft";
+    EXPECT_NEAR(heights[320], 60.0, 1.5) << "high enough already";
 }
 
 TEST(SmoothCurve, KeepsPlaceAndSumOfAPeakAndTheEndsOfALine)

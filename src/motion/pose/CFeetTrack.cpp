@@ -75,14 +75,38 @@ std::vector<std::vector<Contact>> CFeetTrack::Contacts(double secondsPerFrame) c
     return contacts;
 }
 
-FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, const std::vector<Contact>& flat, float ankleFloor,
-                                  float toeFloor, double secondsPerFrame) const
+void CFeetTrack::FindAloft(const std::vector<FootMotion>& motion, FootTouches& touches) const
+{
+    for (const FootMotion& of : motion)
+    {
+        const double height = of.height / m_fLegLength;
+        const double moves =
+            Smoothstep((of.speed / m_fLegLength - kStandSpeed) / (kLeaveSpeed - kStandSpeed));
+        const double rises = Smoothstep((height - kHoverHeight) / (kStandHeight - kHoverHeight));
+        touches.aloft.push_back(static_cast<float>((1.0 - moves) * rises));
+        touches.heights.push_back(static_cast<float>(height));
+    }
+    for (const Contact& contact : touches.flat)
+        std::fill(touches.aloft.begin() + contact.first, touches.aloft.begin() + contact.end, 0.0f);
+}
+
+FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float toeFloor,
+                                  double secondsPerFrame) const
 {
     const FloorPath ankle{leg.Ankles(), ankleFloor};
     const FloorPath toe{leg.HasToe() ? leg.Toes() : leg.Ankles(), leg.HasToe() ? toeFloor : ankleFloor};
-    FootTouches touches{MergedContacts(FindContacts({&ankle, 1}, m_fLegLength, secondsPerFrame),
-                                       FindContacts({&toe, 1}, m_fLegLength, secondsPerFrame)),
-                        std::vector<float>(ankle.positions.size(), 0.0f)};
+    const std::vector<FootMotion> ankleMotion = MotionOf(ankle, secondsPerFrame);
+    const std::vector<FootMotion> toeMotion = leg.HasToe() ? MotionOf(toe, secondsPerFrame) : ankleMotion;
+    const auto find = [&](const std::vector<FootMotion>& of) {
+        return FindContacts(std::span<const FootMotion>(of), m_fLegLength, secondsPerFrame);
+    };
+    const std::vector<FootMotion> motion = JointMotion(ankleMotion, toeMotion);
+    FootTouches touches{MergedContacts(find(ankleMotion), find(toeMotion)),
+                        std::vector<float>(ankle.positions.size(), 0.0f),
+                        find(motion),
+                        {},
+                        {}};
+    FindAloft(motion, touches);
     for (const Contact& contact : touches.contacts)
     {
         double height = kHoverHeight;
@@ -93,7 +117,7 @@ FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, const std::vector<Contac
                 std::min(ankle.positions[frame].y - ankleFloor, toe.positions[frame].y - toe.floor);
             height = std::min(height, static_cast<double>(above) / m_fLegLength);
         }
-        const bool isFlat = std::ranges::any_of(flat, [&](const Contact& other) {
+        const bool isFlat = std::ranges::any_of(touches.flat, [&](const Contact& other) {
             return contact.first <= other.first && other.end <= contact.end;
         });
         const double hovers = isFlat ? 0.0 : Smoothstep((height - kLowHeight) / (kHoverHeight - kLowHeight));
@@ -107,10 +131,9 @@ std::vector<FootTouches> CFeetTrack::Touches(double secondsPerFrame) const
 {
     const float ankleFloor = FloorOf(m_kLegs, &CLegTrack::Ankles);
     const float toeFloor = FloorOf(m_kLegs, &CLegTrack::Toes);
-    const std::vector<std::vector<Contact>> flat = Contacts(secondsPerFrame);
     std::vector<FootTouches> touches;
-    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
-        touches.push_back(TouchesOf(m_kLegs[leg], flat[leg], ankleFloor, toeFloor, secondsPerFrame));
+    for (const CLegTrack& leg : m_kLegs)
+        touches.push_back(TouchesOf(leg, ankleFloor, toeFloor, secondsPerFrame));
     return touches;
 }
 

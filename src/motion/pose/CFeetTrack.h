@@ -18,6 +18,12 @@ struct FootTouches
     /// Confidence, 0 to 1, that the sole is on the floor; one value per frame. It is 1 in a contact in which
     /// ankle and toe stand together, less if only one stands and hovers, and 0 outside of contacts.
     std::vector<float> landed;
+    /// Frames in which ankle and toe stand together.
+    std::vector<Contact> flat;
+    /// Confidence, 0 to 1, that the foot is still without standing; one value per frame.
+    std::vector<float> aloft;
+    /// Height of the higher of ankle and toe above its floor in leg lengths; one value per frame.
+    std::vector<float> heights;
 };
 
 /// Returns the height at which a joint, `Ankles` or `Toes`, of all legs stands on the floor.
@@ -50,8 +56,9 @@ public:
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:
-    FootTouches TouchesOf(const CLegTrack& leg, const std::vector<Contact>& flat, float ankleFloor,
-                          float toeFloor, double secondsPerFrame) const;
+    void FindAloft(const std::vector<FootMotion>& motion, FootTouches& touches) const;
+    FootTouches TouchesOf(const CLegTrack& leg, float ankleFloor, float toeFloor,
+                          double secondsPerFrame) const;
 
     std::vector<CLegTrack> m_kLegs;
     double m_fLegLength = 0.0;

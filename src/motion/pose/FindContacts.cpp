@@ -14,65 +14,68 @@ namespace gw {
 
 namespace {
 
-// Checks how high and how fast the joints of a foot are in a frame.
-class CFootState
+double SpeedBetween(const FloorPath& joint, int from, int to, double secondsPerFrame)
 {
-public:
-    CFootState(std::span<const FloorPath> joints, double leg, double secondsPerFrame)
-        : m_kJoints(joints), m_fLeg(leg), m_fSecondsPerFrame(secondsPerFrame),
-          m_iSpan(std::max(1, static_cast<int>(std::lround(std::min(kSpeedSeconds / secondsPerFrame, 1e6)))))
-    {
-    }
+    const Vec3& start = joint.positions[static_cast<size_t>(from)];
+    return Vec3Length(joint.positions[static_cast<size_t>(to)] - start) / (secondsPerFrame * (to - from));
+}
 
-    int FrameCount() const { return m_kJoints.empty() ? 0 : static_cast<int>(m_kJoints[0].positions.size()); }
-    bool IsWithin(int frame, double height, double speed) const
-    {
-        return std::ranges::all_of(m_kJoints, [=, this](const FloorPath& joint) {
-            const double above = static_cast<double>(At(joint, frame).y - joint.floor);
-            return above < height * m_fLeg && Speed(joint, frame) < speed * m_fLeg;
-        });
-    }
+// Returns the larger value, or NaN if one of them is NaN.
+double LargerOf(double a, double b)
+{
+    return a > b || std::isnan(a) ? a : b;
+}
 
-private:
-    static const Vec3& At(const FloorPath& joint, int frame)
-    {
-        return joint.positions[static_cast<size_t>(frame)];
-    }
-    double SpeedBetween(const FloorPath& joint, int from, int to) const
-    {
-        return Vec3Length(At(joint, to) - At(joint, from)) / (m_fSecondsPerFrame * (to - from));
-    }
-    // Returns the lower of the speeds before and after the frame, so a contact includes its first and last
-    // frame.
-    double Speed(const FloorPath& joint, int frame) const
-    {
-        const int before = std::max(frame - m_iSpan, 0);
-        const int after = std::min(frame + m_iSpan, FrameCount() - 1);
-        if (before == frame && after == frame)
-            return 0.0;
-        if (before == frame || after == frame)
-            return SpeedBetween(joint, before, after);
-        return std::min(SpeedBetween(joint, before, frame), SpeedBetween(joint, frame, after));
-    }
-
-    std::span<const FloorPath> m_kJoints;
-    double m_fLeg;
-    double m_fSecondsPerFrame;
-    int m_iSpan;
-};
+bool IsWithin(const FootMotion& motion, double height, double speed)
+{
+    return motion.height < height && motion.speed < speed;
+}
 
 } // namespace
 
-std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg, double secondsPerFrame)
+std::vector<FootMotion> MotionOf(const FloorPath& joint, double secondsPerFrame)
 {
-    const CFootState foot(joints, leg, secondsPerFrame);
+    const auto last = static_cast<int>(joint.positions.size()) - 1;
+    const int span =
+        std::max(1, static_cast<int>(std::lround(std::min(kSpeedSeconds / secondsPerFrame, 1e6))));
+    std::vector<FootMotion> motion;
+    motion.reserve(joint.positions.size());
+    for (int frame = 0; frame <= last; ++frame)
+    {
+        const int before = std::max(frame - span, 0);
+        const int after = std::min(frame + span, last);
+        const auto between = [&](int from, int to) { return SpeedBetween(joint, from, to, secondsPerFrame); };
+        double speed = 0.0;
+        if (before < frame && frame < after)
+            speed = std::min(between(before, frame), between(frame, after));
+        else if (before < after)
+            speed = between(before, after);
+        const float height = joint.positions[static_cast<size_t>(frame)].y - joint.floor;
+        motion.push_back({static_cast<double>(height), speed});
+    }
+    return motion;
+}
+
+std::vector<FootMotion> JointMotion(const std::vector<FootMotion>& first,
+                                    const std::vector<FootMotion>& second)
+{
+    std::vector<FootMotion> motion = first;
+    for (size_t frame = 0; frame < motion.size(); ++frame)
+        motion[frame] = {LargerOf(motion[frame].height, second[frame].height),
+                         LargerOf(motion[frame].speed, second[frame].speed)};
+    return motion;
+}
+
+std::vector<Contact> FindContacts(std::span<const FootMotion> motion, double leg, double secondsPerFrame)
+{
     std::vector<Contact> contacts;
     bool stands = false;
-    for (int frame = 0; frame < foot.FrameCount(); ++frame)
+    for (int frame = 0; frame < static_cast<int>(motion.size()); ++frame)
     {
+        const FootMotion& at = motion[static_cast<size_t>(frame)];
         const bool stood = stands;
-        stands = stood ? foot.IsWithin(frame, kLeaveHeight, kLeaveSpeed)
-                       : foot.IsWithin(frame, kStandHeight, kStandSpeed);
+        stands = stood ? IsWithin(at, kLeaveHeight * leg, kLeaveSpeed * leg)
+                       : IsWithin(at, kStandHeight * leg, kStandSpeed * leg);
         if (stands && !stood)
             contacts.push_back({frame, frame});
         if (stands)
@@ -82,6 +85,17 @@ std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg,
         return (contact.end - contact.first) * secondsPerFrame < kLeastContactSeconds;
     });
     return contacts;
+}
+
+std::vector<Contact> FindContacts(std::span<const FloorPath> joints, double leg, double secondsPerFrame)
+{
+    std::vector<FootMotion> motion;
+    for (const FloorPath& joint : joints)
+    {
+        const std::vector<FootMotion> more = MotionOf(joint, secondsPerFrame);
+        motion = motion.empty() ? more : JointMotion(motion, more);
+    }
+    return FindContacts(std::span<const FootMotion>(motion), leg, secondsPerFrame);
 }
 
 std::vector<Contact> MergedContacts(std::vector<Contact> contacts, const std::vector<Contact>& more)

@@ -38,6 +38,21 @@ struct FloorPath
     float floor;
 };
 
+/// How a joint, or the joints of a foot together, move in a frame.
+struct FootMotion
+{
+    double height; ///< of the highest joint above its floor
+    double speed;  ///< of the fastest joint; the lower of the speeds before and after the frame
+};
+
+/// Returns how a joint moves, one value per frame, in the unit of the positions.
+std::vector<FootMotion> MotionOf(const FloorPath& joint, double secondsPerFrame);
+/// Returns how two joints move together, one value per frame. Both lists must have the same length.
+std::vector<FootMotion> JointMotion(const std::vector<FootMotion>& first,
+                                    const std::vector<FootMotion>& second);
+/// Returns the contacts of a foot from its motion, as below.
+std::vector<Contact> FindContacts(std::span<const FootMotion> motion, double leg, double secondsPerFrame);
+
 /// Returns the contacts of a foot, in order: the frames in which all its joints (ankle, toe) are low and slow
 /// at the same time. All paths must have the same number of frames. `leg` is the leg's length in the unit of
 /// the positions and must be above 0.

@@ -44,6 +44,8 @@ public:
 
     const Frame& At(size_t frame) const { return m_kFrames[frame]; }
     const LegLengths& Lengths() const { return m_kLengths; }
+    /// Returns the height of the ankle of a foot that stands flat.
+    float AnkleHeight() const { return static_cast<float>(Vec3Length(m_kHeelSole)); }
     /// Returns how far the sole's toe end is below the target's ankle; 0 without a toe.
     float ToeSole(size_t frame) const;
     /// Returns the vector from hip to ankle if thigh and calf point in the source's directions.

@@ -73,7 +73,8 @@ std::vector<FootTouches> CSourceBody::Touches(double secondsPerFrame) const
 {
     if (HasLegs())
         return m_kFeet.Touches(secondsPerFrame);
-    return std::vector<FootTouches>(m_kLegs.size(), {{}, std::vector<float>(FrameCount(), 0.0f)});
+    const std::vector<float> none(FrameCount(), 0.0f);
+    return std::vector<FootTouches>(m_kLegs.size(), {{}, none, {}, none, none});
 }
 
 std::vector<size_t> CSourceBody::Jumps() const

@@ -40,6 +40,9 @@ constexpr double kMostToeTurn = 0.08;   // radians; a toe end that is farther fr
 constexpr double kToeReach = 10.0;      // beyond that, over which a toe end is pulled less and less
 constexpr double kToeWeight = 20.0;     // weight of a toe end on the floor; the foot's own pitch has weight 1
 constexpr double kToeHertz = 3.0;       // of the changes between the two
+constexpr double kSurelyAloft = 10.0;   // height of a foot that is certainly off the floor
+constexpr double kAloftMargin = 0.004;  // in leg lengths, so that rounding does not put the foot on the floor
+constexpr double kMostAloft = 0.11;     // in leg lengths; above that, no foot stands
 constexpr double kLeastFirmness = 0.02; // minimum for any leg, however far its knee is bent
 
 double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
@@ -58,18 +61,17 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
     : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())), m_kJumps(source.Jumps()),
       m_kRoots(source.FrameCount(), kVec3Zero), m_kLifts(source.FrameCount(), 0.0f)
 {
-    const ContactsOfLegs contacts = source.Contacts(secondsPerFrame);
+    const std::vector<FootTouches> touches = source.Touches(secondsPerFrame);
     PlaceRoot(origin);
-    StandOnFloor(contacts, lowestHand);
-    const bool stands = std::ranges::any_of(contacts, [](const auto& leg) { return !leg.empty(); });
+    StandOnFloor(touches, lowestHand);
+    const bool stands = std::ranges::any_of(touches, [](const auto& leg) { return !leg.flat.empty(); });
     m_bHasFloor = m_bHasFloor || stands;
     if (!holdFeet || !stands)
         return;
-    const std::vector<FootTouches> touches = source.Touches(secondsPerFrame);
     for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
         HoldLeg(leg, touches[leg].contacts, secondsPerFrame);
-        LandLeg(leg, touches[leg].landed, secondsPerFrame);
+        LandLeg(leg, touches[leg], secondsPerFrame);
     }
     for (int round = 0; round < kRounds; ++round)
         LiftRoot(secondsPerFrame);
@@ -113,7 +115,7 @@ float CStandPlan::FreeSole(size_t leg, size_t frame) const
 
 // Raises or lowers the whole motion onto the floor, using the median of the contacts. Without contacts, the
 // lowest frames of the feet are on the floor, or the hands if they get even lower, as in a handstand.
-void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts, float lowestHand)
+void CStandPlan::StandOnFloor(const std::vector<FootTouches>& touches, float lowestHand)
 {
     if (m_kRoots.empty())
         return;
@@ -121,7 +123,7 @@ void CStandPlan::StandOnFloor(const ContactsOfLegs& contacts, float lowestHand)
     std::vector<float> all;
     for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
-        for (const Contact& contact : contacts[leg])
+        for (const Contact& contact : touches[leg].flat)
         {
             for (int frame = contact.first; frame < contact.end; ++frame)
                 standing.push_back(-FreeSole(leg, static_cast<size_t>(frame)));
@@ -182,13 +184,34 @@ void CStandPlan::HoldLeg(size_t leg, const std::vector<Contact>& contacts, doubl
     }
 }
 
-void CStandPlan::LandLeg(size_t leg, const std::vector<float>& landed, double secondsPerFrame)
+// Returns where the sole should be. A foot that is still but above the floor, on a step for example, is at
+// least as high as the source's. It may be lower on its free path, because the feet stand at several heights
+// and the plan has only one floor.
+SoleWish CStandPlan::WishedSole(size_t leg, size_t frame, const FootTouches& touches) const
 {
-    std::vector<float> free;
+    const CFaithfulLeg& of = legs_[leg];
+    const double length = of.Lengths().upper + of.Lengths().lower;
+    const float free = FreeSole(leg, frame);
+    const float pitched = of.At(frame).sole - std::min(of.AnkleHeight(), of.ToeSole(frame));
+    const double height = static_cast<double>(touches.heights[frame]) + kAloftMargin;
+    const double least = std::min(height, kMostAloft) * length - static_cast<double>(pitched);
+    const double aloft = static_cast<double>(touches.aloft[frame]) * Smoothstep(least / kSurelyAloft) *
+                         Smoothstep(static_cast<double>(free) / kSurelyAloft);
+    return {free, touches.landed[frame] * static_cast<float>(1.0 - aloft), static_cast<float>(aloft),
+            static_cast<float>(least)};
+}
+
+void CStandPlan::LandLeg(size_t leg, const FootTouches& touches, double secondsPerFrame)
+{
+    std::vector<SoleWish> wishes;
+    std::vector<float> landed;
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
-        free.push_back(FreeSole(leg, frame));
-    const std::vector<double> soles = LandFoot(free, landed, secondsPerFrame);
-    m_kLanded.push_back(landed);
+    {
+        wishes.push_back(WishedSole(leg, frame, touches));
+        landed.push_back(wishes.back().landed);
+    }
+    const std::vector<double> soles = LandFoot(wishes, secondsPerFrame);
+    m_kLanded.push_back(std::move(landed));
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
         m_kAnkles[leg][frame].y = static_cast<float>(soles[frame]) + legs_[leg].At(frame).sole;
 }

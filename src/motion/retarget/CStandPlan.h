@@ -2,6 +2,7 @@
 
 #include "CFaithfulLeg.h"
 #include "CSourceBody.h"
+#include "LandFoot.h"
 
 #include <cstddef>
 #include <vector>
@@ -35,15 +36,14 @@ public:
     bool HasFloor() const { return m_bHasFloor; }
 
 private:
-    using ContactsOfLegs = std::vector<std::vector<Contact>>;
-
     Vec3 Hips(size_t frame) const;
     void PlaceRoot(const Vec3& origin);
     Vec3 FreeAnkle(size_t leg, size_t frame) const;
     float FreeSole(size_t leg, size_t frame) const;
-    void StandOnFloor(const ContactsOfLegs& contacts, float lowestHand);
+    void StandOnFloor(const std::vector<FootTouches>& touches, float lowestHand);
     void HoldLeg(size_t leg, const std::vector<Contact>& contacts, double secondsPerFrame);
-    void LandLeg(size_t leg, const std::vector<float>& landed, double secondsPerFrame);
+    SoleWish WishedSole(size_t leg, size_t frame, const FootTouches& touches) const;
+    void LandLeg(size_t leg, const FootTouches& touches, double secondsPerFrame);
     void AddWish(size_t leg, size_t frame, CBandFit& lifts) const;
     double WantedToeDrop(size_t leg, size_t frame) const;
     void LowerToe(size_t leg, double secondsPerFrame);

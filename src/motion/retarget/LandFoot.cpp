@@ -1,13 +1,15 @@
 // Heights are found by least squares over all frames: the sole on the floor once it has landed, elsewhere
 // close to its free path, without sudden changes. A little is left of the free height of a sole that has
 // landed, so that steps on a floor that is not quite level do not shake the leg. But a sole that would
-// visibly hover is weighted more in a second round, which takes it down.
+// visibly hover is weighted more in a second round, which takes it down. A foot that is still in the air, or
+// on a step, is kept from coming so low that it seems to stand.
 
 #include "LandFoot.h"
 
 #include "CBandFit.h"
 #include "Figures.h"
 
+#include <algorithm>
 #include <cmath>
 
 namespace gw {
@@ -17,30 +19,33 @@ namespace {
 constexpr double kFullDip = 20.0;     // millimeters below the floor at which kDipWeight applies in full
 constexpr double kLandedWeight = 6.0; // weight of a sole that stands; the free path has weight 1
 constexpr double kDipWeight = 15.0;   // weight of a sole below the floor
+constexpr double kAloftWeight = 4.0;  // weight of a foot that is still but does not stand
 constexpr double kLandHertz = 1.4;    // of the changes between the two
 constexpr double kHover = 12.0;       // millimeters from the floor at which a landed sole is weighted double
-constexpr int kRounds = 2;
+constexpr int kLandRounds = 2;
 
 } // namespace
 
-std::vector<double> LandFoot(std::span<const float> free, std::span<const float> landed,
-                             double secondsPerFrame)
+std::vector<double> LandFoot(std::span<const SoleWish> wishes, double secondsPerFrame)
 {
-    std::vector<double> heights(free.size(), 0.0);
-    for (int round = 0; round < kRounds; ++round)
+    std::vector<double> heights(wishes.size(), 0.0);
+    for (int round = 0; round < kLandRounds; ++round)
     {
-        CBandFit rise(free.size(), BendWeight(kLandHertz, secondsPerFrame), 1.0);
-        for (size_t frame = 0; frame < free.size(); ++frame)
+        CBandFit rise(wishes.size(), BendWeight(kLandHertz, secondsPerFrame), 1.0);
+        for (size_t frame = 0; frame < wishes.size(); ++frame)
         {
-            const auto sole = static_cast<double>(free[frame]);
-            const auto share = static_cast<double>(landed[frame]);
+            const SoleWish& wish = wishes[frame];
+            const auto sole = static_cast<double>(wish.free);
+            const auto share = static_cast<double>(wish.landed);
             const double hovers = std::pow(share * heights[frame] / kHover, 4.0);
             rise.AddValue(frame, share > 0.0 ? kLandedWeight * (1.0 + hovers) : 0.0, -share * sole);
+            rise.AddValue(frame, kAloftWeight * static_cast<double>(wish.aloft),
+                          static_cast<double>(std::max(wish.least - wish.free, 0.0f)));
             rise.AddValue(frame, kDipWeight * Smoothstep(-sole / kFullDip), -sole);
         }
         heights = rise.Solve();
         for (size_t frame = 0; frame < heights.size(); ++frame)
-            heights[frame] += static_cast<double>(free[frame]);
+            heights[frame] += static_cast<double>(wishes[frame].free);
     }
     return heights;
 }
