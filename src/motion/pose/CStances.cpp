@@ -83,15 +83,19 @@ const Mat4& CStances::World(size_t stance, int joint) const
     const auto index = static_cast<size_t>(joint);
     if (stance == 0)
         return m_kRest[index];
-    if (m_kInFrames[index].empty())
-        PoseInFrames(index);
+    std::vector<CNode*> waiting; // this joint and its ancestors; a skeleton can be too deep for recursion
+    for (int above = joint; above >= 0 && m_kInFrames[static_cast<size_t>(above)].empty();
+         above = IndexOf(waiting.back()->GetParentNode()))
+        waiting.push_back(m_kJoints[static_cast<size_t>(above)]);
+    for (; !waiting.empty(); waiting.pop_back())
+        PoseInFrames(*waiting.back());
     return m_kInFrames[index][stance - 1];
 }
 
-// Poses the joint alone: its parent is given the world matrices that it has in the frames.
-void CStances::PoseInFrames(size_t joint) const
+// Poses a joint alone: its parent is given the world matrices that it has in the frames.
+void CStances::PoseInFrames(CNode& node) const
 {
-    CNode& node = *m_kJoints[joint];
+    const auto joint = static_cast<size_t>(IndexOf(&node));
     CNode* const parent = node.GetParentNode();
     const int above = IndexOf(parent);
     const CPoseKeeper keeper(node);
@@ -102,7 +106,7 @@ void CStances::PoseInFrames(size_t joint) const
     for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
     {
         if (above >= 0)
-            parent->m_kWorldMatrix = World(frame + 1, above);
+            parent->m_kWorldMatrix = m_kInFrames[static_cast<size_t>(above)][frame];
         node.CSpatial::UpdateTransform(m_kTimes[frame]);
         worlds.push_back(node.m_kWorldMatrix);
     }

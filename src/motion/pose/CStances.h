@@ -39,7 +39,7 @@ public:
 
 private:
     const Mat4& World(size_t stance, int joint) const;
-    void PoseInFrames(size_t joint) const;
+    void PoseInFrames(CNode& node) const;
 
     std::vector<CNode*> m_kJoints;
     std::unordered_map<const CNode*, int> m_kIndex;
