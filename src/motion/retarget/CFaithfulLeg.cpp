@@ -11,6 +11,11 @@ namespace gw {
 
 namespace {
 
+// The share of a foot's pitch by which the toe end of its sole turns. Toes that stay flat would turn by 0,
+// toes that do not bend by 1. How a source bends them is not followed, because some bend them within one
+// frame.
+constexpr double kToeTurn = 0.35;
+
 size_t IndexOf(const CPoseMatcher& matcher, const CNode* node)
 {
     return static_cast<size_t>(matcher.IndexOf(node));
@@ -98,7 +103,9 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
         at.pitch = PitchFoot(toe, {m_kFlatToe.ahead + moved.ahead, m_kFlatToe.height + moved.height});
         at.toe = Turned(toe, at.pitch);
         heel = Turned(heel, at.pitch);
-        lowest = std::min(heel.y, at.toe.y - m_fToeSole);
+        const double upright = static_cast<double>(-heel.y) / Vec3Length(heel);
+        at.toeSole = m_fToeSole * static_cast<float>(1.0 - kToeTurn * (1.0 - upright));
+        lowest = std::min(heel.y, at.toe.y - at.toeSole);
     }
     const Mat4& thigh = bones[m_uiThigh].world;
     at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
@@ -109,7 +116,7 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
 
 float CFaithfulLeg::ToeSole(size_t frame) const
 {
-    return m_iToe < 0 ? 0.0f : m_fToeSole - m_kFrames[frame].toe.y;
+    return m_iToe < 0 ? 0.0f : m_kFrames[frame].toeSole - m_kFrames[frame].toe.y;
 }
 
 Vec3 CFaithfulLeg::Stretch(size_t frame) const

@@ -24,6 +24,7 @@ public:
         Vec3 toe = kVec3Zero;       ///< the target's toe joint, relative to its ankle; zero without one
         float heel = 0.0f;          ///< how far the sole's heel end is below the target's ankle
         float sole = 0.0f;          ///< same for the sole's lower end
+        float toeSole = 0.0f;       ///< how far the sole's toe end is below the target's toe joint
         Mat3 pitch = kMat3Identity; ///< rotation of the target's foot that makes up for its length
     };
 
@@ -73,9 +74,9 @@ private:
     size_t m_uiFoot;
     int m_iToe; // -1 for a foot without one
     LegLengths m_kLengths;
-    Vec3 m_kHeelSole;        // in the foot's space
-    ToePlace m_kFlatToe{};   // in the rest pose
-    float m_fToeSole = 0.0f; // below the toe joint, however it is bent: some sources bend it within one frame
+    Vec3 m_kHeelSole;            // in the foot's space
+    ToePlace m_kFlatToe{};       // in the rest pose
+    float m_fToeSole = 0.0f;     // below the toe joint in the rest pose
     Vec3 m_kForward = kVec3Zero; // summed over the frames, in the thigh's space
     std::vector<size_t> m_kPath;
     std::vector<Frame> m_kFrames;

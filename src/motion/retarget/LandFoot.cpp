@@ -1,8 +1,8 @@
 // Heights are found by least squares over all frames: the sole on the floor once it has landed, elsewhere
 // close to its free path, without sudden changes. A little is left of the free height of a sole that has
 // landed, so that steps on a floor that is not quite level do not shake the leg. But a sole that would
-// visibly hover is weighted more in a second round, which takes it down. A foot that is still in the air, or
-// on a step, is kept from coming so low that it seems to stand.
+// visibly hover or sink is weighted more in a second round, which corrects it. A foot that is still in the
+// air, or on a step, is kept from coming so low that it seems to stand.
 
 #include "LandFoot.h"
 
@@ -22,6 +22,8 @@ constexpr double kDipWeight = 15.0;   // weight of a sole below the floor
 constexpr double kAloftWeight = 4.0;  // weight of a foot that is still but does not stand
 constexpr double kLandHertz = 1.4;    // of the changes between the two
 constexpr double kHover = 12.0;       // millimeters from the floor at which a landed sole is weighted double
+constexpr double kSunk = 6.0;         // millimeters below the floor at which a dip is weighted double
+constexpr double kMostSunk = 3.0;     // what sinking adds to the weight of a dip, at most
 constexpr int kLandRounds = 2;
 
 } // namespace
@@ -41,7 +43,8 @@ std::vector<double> LandFoot(std::span<const SoleWish> wishes, double secondsPer
             rise.AddValue(frame, share > 0.0 ? kLandedWeight * (1.0 + hovers) : 0.0, -share * sole);
             rise.AddValue(frame, kAloftWeight * static_cast<double>(wish.aloft),
                           static_cast<double>(std::max(wish.least - wish.free, 0.0f)));
-            rise.AddValue(frame, kDipWeight * Smoothstep(-sole / kFullDip), -sole);
+            const double sinks = std::min(std::pow(std::min(heights[frame], 0.0) / kSunk, 4.0), kMostSunk);
+            rise.AddValue(frame, kDipWeight * (1.0 + sinks) * Smoothstep(-sole / kFullDip), -sole);
         }
         heights = rise.Solve();
         for (size_t frame = 0; frame < heights.size(); ++frame)
