@@ -24,11 +24,6 @@ bool IsWordCharacter(char c)
     return (c >= 'a' && c <= 'z') || (c >= '0' && c <= '9') || (c & 0x80) != 0;
 }
 
-bool HasPrefix(std::string_view name, std::string_view prefix)
-{
-    return name.size() > prefix.size() && EqualNoCase(name.substr(0, prefix.size()), prefix);
-}
-
 bool IsUnderstood(const JointName& name)
 {
     return name.word != EJointWord::None;
@@ -65,19 +60,22 @@ std::vector<std::string> SharedStarts(std::span<const std::string_view> names)
 }
 
 // Counts the names that can be interpreted without a prefix; 0 as soon as there must be fewer than `least`.
-// Names that do not have it come first, because what they mean is known. Most candidates fail within the
-// first few of the others.
+// What names mean that do not have it is known. Most candidates fail within the first few of the others.
 size_t CountUnderstood(std::span<const std::string_view> names, std::span<const JointName> whole,
                        std::string_view prefix, size_t least)
 {
     size_t count = names.size();
+    std::vector<std::string_view> rests;
     for (size_t i = 0; i < names.size(); ++i)
-        count -= HasPrefix(names[i], prefix) || IsUnderstood(whole[i]) ? 0 : 1;
-    for (size_t i = 0; i < names.size() && count >= least; ++i)
     {
-        if (HasPrefix(names[i], prefix) && !IsUnderstood(ReadJointName(WithoutPrefix(names[i], prefix))))
-            --count;
+        const std::string_view rest = WithoutPrefix(names[i], prefix);
+        if (rest.size() < names[i].size())
+            rests.push_back(rest);
+        else
+            count -= IsUnderstood(whole[i]) ? 0 : 1;
     }
+    for (size_t i = 0; i < rests.size() && count >= least; ++i)
+        count -= IsUnderstood(ReadJointName(rests[i])) ? 0 : 1;
     return count >= least ? count : 0;
 }
 
@@ -111,7 +109,8 @@ std::string FindNamePrefix(std::span<const std::string_view> names, std::span<co
 
 std::string_view WithoutPrefix(std::string_view name, std::string_view prefix)
 {
-    return HasPrefix(name, prefix) ? name.substr(prefix.size()) : name;
+    const bool has = name.size() > prefix.size() && EqualNoCase(name.substr(0, prefix.size()), prefix);
+    return has ? name.substr(prefix.size()) : name;
 }
 
 } // namespace gw

@@ -103,7 +103,8 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
         at.pitch = PitchFoot(toe, {m_kFlatToe.ahead + moved.ahead, m_kFlatToe.height + moved.height});
         at.toe = Turned(toe, at.pitch);
         heel = Turned(heel, at.pitch);
-        const double upright = static_cast<double>(-heel.y) / Vec3Length(heel);
+        const double ankleHeight = Vec3Length(heel);
+        const double upright = ankleHeight > 0.0 ? static_cast<double>(-heel.y) / ankleHeight : 1.0;
         at.toeSole = m_fToeSole * static_cast<float>(1.0 - kToeTurn * (1.0 - upright));
         lowest = std::min(heel.y, at.toe.y - at.toeSole);
     }
