@@ -4,8 +4,11 @@
 #include "HoldFoot.h"
 #include "Angles.h"
 #include "CBandFit.h"
+#include "Directions.h"
 #include "LandFoot.h"
 #include "SmoothCurve.h"
+#include "StandSteps.h"
+#include "YieldFoot.h"
 #include "YieldKnee.h"
 
 #include <algorithm>
@@ -72,9 +75,21 @@ struct Foot
         toe.push_back(way * 144.0f);
         free.push_back(ankle + Vec3{0.0f, 0.0f, strayed});
     }
+    // A foot that turns about y in place, on the middle of the source's foot.
+    void AddTurned(float degrees, float length)
+    {
+        const float angle = degrees * kDegreesToRadians;
+        const Vec3 way{std::sin(angle), 0.0f, std::cos(angle)};
+        sourceAnkle.push_back(way * -50.0f);
+        sourceToe.push_back(way * 50.0f);
+        toe.push_back(way * length);
+        free.push_back(kVec3Zero);
+    }
+    FootPaths Paths() const { return {toe, sourceAnkle, sourceToe, kLeg}; }
+    StandingFoot Stand(const FootStands& stands) const { return StandSteps(Paths(), stands, kSeconds); }
     std::vector<Vec3> Hold(const std::vector<Contact>& contacts) const
     {
-        return HoldFoot({free, toe, sourceAnkle, sourceToe, kLeg}, contacts, kSeconds);
+        return HoldFoot(free, Stand({contacts, {}, {}, {}}).steps, contacts, kSeconds);
     }
 };
 
@@ -137,10 +152,56 @@ TEST(HoldFoot, JumpBeforeAContactDoesNotMoveThePivot)
     for (int frame = 1; frame < 60; ++frame)
         foot.Add(kVec3Zero, std::max(60.0f - 10.0f * static_cast<float>(frame), 0.0f), 0.0f);
     const size_t jumps[] = {0};
-    const std::vector<Vec3> path = HoldFoot({foot.free, foot.toe, foot.sourceAnkle, foot.sourceToe, kLeg},
-                                            {{Contact{1, 60}}}, kSeconds, jumps);
+    const Contact contacts[] = {{1, 60}};
+    const std::vector<Vec3> path =
+        HoldFoot(foot.free, foot.Stand({contacts, {}, {}, jumps}).steps, contacts, kSeconds);
     for (size_t frame = 2; frame < 60; ++frame)
         EXPECT_NEAR(path[frame].z, path[1].z, 6.0f) << frame;
+}
+
+// The ankle stays at first, because it is slower; the toe does all of the foot's surplus.
+TEST(StandSteps, AnkleAndToeOfALongFootShareItsSlide)
+{
+    Foot foot;
+    for (int frame = 0; frame < 60; ++frame)
+    {
+        foot.AddTurned(static_cast<float>(frame), 150.0f);
+        foot.sourceAnkle.back() = foot.sourceAnkle.back() * 0.4f;
+        foot.sourceToe.back() = foot.sourceToe.back() * 1.6f;
+    }
+    const Contact stand[] = {{0, 60}};
+    const StandingFoot alone = foot.Stand({stand, {}, stand, {}});
+    const StandingFoot shared = foot.Stand({stand, stand, stand, {}});
+    EXPECT_LT(alone.toeSlides[0], 10.0) << "nobody minds how the ankle slides";
+    EXPECT_GT(shared.ankleSlides[0], 15.0);
+    EXPECT_NEAR(shared.ankleSlides[0], shared.toeSlides[0], 4.0);
+}
+
+TEST(YieldFoot, LongFootTurnsAFewDegreesLessAndSlidesLessAndAnEqualOneNotAtAll)
+{
+    const Contact stand[] = {{20, 80}};
+    const FootStands stands{stand, stand, stand, {}};
+    const std::vector<float> lifts(100, 0.0f);
+    // the length of the target's foot, and the least and most degrees that it turns less
+    for (const auto& [length, least, most] :
+         {std::tuple{100.0f, 0.0, 0.1}, {120.0f, 8.0, 14.0}, {200.0f, 12.0, 17.2}})
+    {
+        SCOPED_TRACE(length);
+        Foot foot;
+        for (int frame = 0; frame < 100; ++frame)
+            foot.AddTurned(std::clamp(1.5f * static_cast<float>(frame - 20), 0.0f, 90.0f), length);
+        const std::vector<Mat3> turns = YieldFoot(foot.Paths(), stands, lifts, kSeconds);
+        const double before = foot.Stand(stands).toeSlides[0];
+        for (size_t frame = 0; frame < 100; ++frame)
+            foot.toe[frame] = Turned(foot.toe[frame], turns[frame]);
+        const double turned =
+            std::atan2(foot.toe[79].x, foot.toe[79].z) - std::atan2(foot.toe[20].x, foot.toe[20].z);
+        const double less = 88.5 - turned * kRadiansToDegrees64;
+        EXPECT_GE(less, least);
+        EXPECT_LE(less, most);
+        EXPECT_LE(foot.Stand(stands).toeSlides[0], before + 0.01 - 0.7 * less);
+        EXPECT_LE(Vec3Length(foot.toe[99] - Vec3{length, 0.0f, 0.0f}), 0.15f * length) << "it comes back";
+    }
 }
 
 TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)

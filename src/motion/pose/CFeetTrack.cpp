@@ -58,23 +58,6 @@ void CFeetTrack::MeasureLegs()
     m_fLegLength = lengths.Mean();
 }
 
-std::vector<std::vector<Contact>> CFeetTrack::Contacts(double secondsPerFrame) const
-{
-    const float ankleFloor = FloorOf(m_kLegs, &CLegTrack::Ankles);
-    const float toeFloor = FloorOf(m_kLegs, &CLegTrack::Toes);
-    std::vector<std::vector<Contact>> contacts;
-    for (const CLegTrack& leg : m_kLegs)
-    {
-        std::vector<FloorPath> joints{
-            {leg.Ankles(), ankleFloor}
-        };
-        if (leg.HasToe())
-            joints.push_back({leg.Toes(), toeFloor});
-        contacts.push_back(FindContacts(joints, m_fLegLength, secondsPerFrame));
-    }
-    return contacts;
-}
-
 void CFeetTrack::FindAloft(const std::vector<FootMotion>& motion, FootTouches& touches) const
 {
     for (const FootMotion& of : motion)
@@ -101,12 +84,15 @@ FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float 
         return FindContacts(std::span<const FootMotion>(of), m_fLegLength, secondsPerFrame);
     };
     const std::vector<FootMotion> motion = JointMotion(ankleMotion, toeMotion);
-    FootTouches touches{MergedContacts(find(ankleMotion), find(toeMotion)),
-                        std::vector<float>(ankle.positions.size(), 0.0f),
-                        find(motion),
-                        {},
-                        {}};
+    FootTouches touches;
+    touches.ankle = find(ankleMotion);
+    touches.toe = find(toeMotion);
+    touches.contacts = MergedContacts(touches.ankle, touches.toe);
+    touches.landed.assign(ankle.positions.size(), 0.0f);
+    touches.flat = find(motion);
     FindAloft(motion, touches);
+    if (!leg.HasToe())
+        touches.toe.clear();
     for (const Contact& contact : touches.contacts)
     {
         double height = kHoverHeight;

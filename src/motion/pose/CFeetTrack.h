@@ -24,6 +24,10 @@ struct FootTouches
     std::vector<float> aloft;
     /// Height of the higher of ankle and toe above its floor in leg lengths; one value per frame.
     std::vector<float> heights;
+    /// Frames in which the ankle stands, whatever the toe does.
+    std::vector<Contact> ankle;
+    /// Same for the toe; empty for a foot without one.
+    std::vector<Contact> toe;
 };
 
 /// Returns the height at which a joint, `Ankles` or `Toes`, of all legs stands on the floor.
@@ -49,9 +53,6 @@ public:
     const std::vector<CLegTrack>& Legs() const { return m_kLegs; }
     /// Returns the mean length of the legs, in the skeleton's units; 0 without legs or before MeasureLegs.
     double LegLength() const { return m_fLegLength; }
-    /// Returns the contacts of each leg: frames in which ankle and toe stand together. The legs must have
-    /// been measured.
-    std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
     /// Returns when each leg touches the floor. The legs must have been measured.
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 

@@ -95,29 +95,39 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
     const auto& bones = matcher.Bones();
     const Mat4& ankle = bones[m_uiFoot].world;
     Frame& at = m_kFrames[frame];
-    Vec3 heel = TransformCoord(m_kHeelSole, ankle) - ankle.Translation();
-    float lowest = heel.y;
-    if (m_iToe >= 0)
-    {
-        const Vec3 toe = bones[static_cast<size_t>(m_iToe)].world.Translation() - ankle.Translation();
-        at.pitch = PitchFoot(toe, {m_kFlatToe.ahead + moved.ahead, m_kFlatToe.height + moved.height});
-        at.toe = Turned(toe, at.pitch);
-        heel = Turned(heel, at.pitch);
-        const double ankleHeight = Vec3Length(heel);
-        const double upright = ankleHeight > 0.0 ? static_cast<double>(-heel.y) / ankleHeight : 1.0;
-        at.toeSole = m_fToeSole * static_cast<float>(1.0 - kToeTurn * (1.0 - upright));
-        lowest = std::min(heel.y, at.toe.y - at.toeSole);
-    }
     const Mat4& thigh = bones[m_uiThigh].world;
     at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
-    at.heel = -heel.y;
-    at.sole = -lowest;
+    at.pitch = kMat3Identity;
+    at.heelEnd = TransformCoord(m_kHeelSole, ankle) - ankle.Translation();
+    Mat3 pitch = kMat3Identity;
+    if (HasToe())
+    {
+        at.toe = bones[static_cast<size_t>(m_iToe)].world.Translation() - ankle.Translation();
+        pitch = PitchFoot(at.toe, {m_kFlatToe.ahead + moved.ahead, m_kFlatToe.height + moved.height});
+    }
+    TurnFoot(frame, pitch);
     m_kForward = m_kForward + ToLocal(at.thigh - at.shin, NormalizedRows(thigh));
+}
+
+void CFaithfulLeg::TurnFoot(size_t frame, const Mat3& turn)
+{
+    Frame& at = m_kFrames[frame];
+    at.pitch = at.pitch * turn;
+    at.heelEnd = Turned(at.heelEnd, turn);
+    at.heel = -at.heelEnd.y;
+    at.sole = at.heel;
+    if (!HasToe())
+        return;
+    at.toe = Turned(at.toe, turn);
+    const double ankleHeight = Vec3Length(at.heelEnd);
+    const double upright = ankleHeight > 0.0 ? static_cast<double>(at.heel) / ankleHeight : 1.0;
+    at.toeSole = m_fToeSole * static_cast<float>(1.0 - kToeTurn * (1.0 - upright));
+    at.sole = std::max(at.heel, ToeSole(frame));
 }
 
 float CFaithfulLeg::ToeSole(size_t frame) const
 {
-    return m_iToe < 0 ? 0.0f : m_kFrames[frame].toeSole - m_kFrames[frame].toe.y;
+    return !HasToe() ? 0.0f : m_kFrames[frame].toeSole - m_kFrames[frame].toe.y;
 }
 
 Vec3 CFaithfulLeg::Stretch(size_t frame) const

@@ -22,8 +22,9 @@ public:
         Vec3 shin;                  ///< unit direction of the source from knee to ankle
         Vec3 hip = kVec3Zero;       ///< the target's hip joint, relative to its root
         Vec3 toe = kVec3Zero;       ///< the target's toe joint, relative to its ankle; zero without one
-        float heel = 0.0f;          ///< how far the sole's heel end is below the target's ankle
-        float sole = 0.0f;          ///< same for the sole's lower end
+        Vec3 heelEnd = kVec3Zero;   ///< the heel end of the target's sole, relative to its ankle
+        float heel = 0.0f;          ///< how far that is below the ankle
+        float sole = 0.0f;          ///< how far the sole's lower end is below the ankle
         float toeSole = 0.0f;       ///< how far the sole's toe end is below the target's toe joint
         Mat3 pitch = kMat3Identity; ///< rotation of the target's foot that makes up for its length
     };
@@ -43,7 +44,12 @@ public:
     /// that stands flat, in the target's scale; NaN for a foot without a toe.
     void ReadTarget(const CPoseMatcher& matcher, size_t frame, const ToePlace& moved);
 
+    /// Rotates the target's foot in a frame that has been read.
+    void TurnFoot(size_t frame, const Mat3& turn);
+
     const Frame& At(size_t frame) const { return m_kFrames[frame]; }
+    /// Returns whether the target's foot has a toe.
+    bool HasToe() const { return m_iToe >= 0; }
     const LegLengths& Lengths() const { return m_kLengths; }
     /// Returns the height of the ankle of a foot that stands flat.
     float AnkleHeight() const { return static_cast<float>(Vec3Length(m_kHeelSole)); }

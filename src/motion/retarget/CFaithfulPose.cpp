@@ -6,6 +6,7 @@
 #include "JointSteps.h"
 #include "PointBone.h"
 #include "Skeleton.h"
+#include "YieldFoot.h"
 
 #include <algorithm>
 #include <cmath>
@@ -117,16 +118,53 @@ ToePlace CFaithfulPose::ToeMoved(size_t leg, size_t frame, double flatDrop) cons
     return {(place.ahead - std::sqrt(std::max(square, 0.0))) * scale, (place.height + flatDrop) * scale};
 }
 
+// Rotates a foot that has a toe by the few degrees that keep it from sliding.
+void CFaithfulPose::YieldFeet(double secondsPerFrame, double flatDrop)
+{
+    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    {
+        CFaithfulLeg& of = m_kLegs[leg];
+        const CLegTrack& track = m_kSource.Leg(leg);
+        if (!track.HasToe() || !of.HasToe())
+            continue;
+        const double length = of.Lengths().upper + of.Lengths().lower;
+        const auto scale = static_cast<float>(length / m_kSource.LegLength());
+        std::vector<Vec3> toe;
+        std::vector<Vec3> sourceAnkle;
+        std::vector<Vec3> sourceToe;
+        std::vector<float> lifts;
+        for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
+        {
+            toe.push_back(of.At(frame).toe);
+            sourceAnkle.push_back(track.Ankles()[frame] * scale);
+            sourceToe.push_back(track.Toes()[frame] * scale);
+            lifts.push_back(static_cast<float>(std::fabs(ToeMoved(leg, frame, flatDrop).height)));
+        }
+        const FootTouches& touch = m_kSource.Touches()[leg];
+        const std::vector<Mat3> turns =
+            YieldFoot({toe, sourceAnkle, sourceToe, length},
+                      {touch.contacts, touch.ankle, touch.toe, m_kSource.Jumps()}, lifts, secondsPerFrame);
+        for (size_t frame = 0; frame < turns.size(); ++frame)
+        {
+            if (turns[frame] != kMat3Identity)
+                of.TurnFoot(frame, turns[frame]);
+        }
+    }
+}
+
 void CFaithfulPose::Plan(const std::vector<CKeyframeControl*>& tracks, const Vec3& origin,
                          double secondsPerFrame, bool holdFeet)
 {
-    const auto flatDrop = static_cast<double>(m_kSource.FlatDrop(secondsPerFrame));
+    m_kSource.FindTouches(secondsPerFrame);
+    const auto flatDrop = static_cast<double>(m_kSource.FlatDrop());
     for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
     {
         PoseFrame(frame, tracks);
         for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
             m_kLegs[leg].ReadTarget(matcher_, frame, ToeMoved(leg, frame, flatDrop));
     }
+    if (holdFeet)
+        YieldFeet(secondsPerFrame, flatDrop);
     plan_.emplace(m_kLegs, m_kSource, m_kHands.LowestHand(), origin, secondsPerFrame, holdFeet);
 }
 

@@ -64,41 +64,29 @@ bool CSourceBody::HasLegs() const
     return LegLength() > 0.0 && std::isfinite(LegLength());
 }
 
-std::vector<std::vector<Contact>> CSourceBody::Contacts(double secondsPerFrame) const
+void CSourceBody::FindTouches(double secondsPerFrame)
 {
-    return HasLegs() ? m_kFeet.Contacts(secondsPerFrame) : std::vector<std::vector<Contact>>(m_kLegs.size());
-}
-
-std::vector<FootTouches> CSourceBody::Touches(double secondsPerFrame) const
-{
-    if (HasLegs())
-        return m_kFeet.Touches(secondsPerFrame);
     const std::vector<float> none(FrameCount(), 0.0f);
-    return std::vector<FootTouches>(m_kLegs.size(), {{}, none, {}, none, none});
-}
-
-std::vector<size_t> CSourceBody::Jumps() const
-{
-    std::vector<size_t> jumps;
+    m_kTouches = HasLegs() ? m_kFeet.Touches(secondsPerFrame)
+                           : std::vector<FootTouches>(m_kLegs.size(), {{}, none, {}, none, none, {}, {}});
+    m_kJumps.clear();
     for (size_t frame = 0; frame + 1 < FrameCount(); ++frame)
     {
         const auto jump = [&](const std::vector<Vec3>& path) { return JumpsAfter(path, frame, LegLength()); };
         if (jump(m_kHips) || std::ranges::any_of(m_kFeet.Legs(), jump, &CLegTrack::Ankles))
-            jumps.push_back(frame);
+            m_kJumps.push_back(frame);
     }
-    return jumps;
 }
 
-float CSourceBody::FlatDrop(double secondsPerFrame) const
+float CSourceBody::FlatDrop() const
 {
     std::vector<float> drops;
-    const std::vector<std::vector<Contact>> contacts = Contacts(secondsPerFrame);
     for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
     {
         const CLegTrack& track = Leg(leg);
         if (!track.HasToe())
             continue;
-        for (const Contact& contact : contacts[leg])
+        for (const Contact& contact : m_kTouches[leg].flat)
         {
             for (auto frame = static_cast<size_t>(contact.first); frame < static_cast<size_t>(contact.end);
                  ++frame)

@@ -29,17 +29,17 @@ public:
     /// Returns the world position of the midpoint of the hip joints.
     const Vec3& Hips(size_t frame) const { return m_kHips[frame]; }
     const CLegTrack& Leg(size_t leg) const { return m_kFeet.Legs()[leg]; }
-    /// Returns the contacts of each leg. The lists are empty if the legs have no length.
-    std::vector<std::vector<Contact>> Contacts(double secondsPerFrame) const;
-    /// Returns the touches of each leg. They are empty, and nothing has landed, if the legs have no length.
-    std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
+    /// Finds when the feet touch the floor and where the source jumps. Call it after the last frame; what
+    /// follows needs it.
+    void FindTouches(double secondsPerFrame);
+    /// Returns the touches of each leg. They are empty, and nothing has landed, if the legs have no length.
+    const std::vector<FootTouches>& Touches() const { return m_kTouches; }
     /// Returns the frames after which the hips or an ankle jump: from a stance before the recording to its
     /// start, for example, or from one take to the next.
-    std::vector<size_t> Jumps() const;
-
+    const std::vector<size_t>& Jumps() const { return m_kJumps; }
     /// Returns the height of the ankle above the toe in a foot that stands flat, measured while feet stand.
-    float FlatDrop(double secondsPerFrame) const;
+    float FlatDrop() const;
 
 private:
     bool HasLegs() const;
@@ -49,6 +49,8 @@ private:
     CFeetTrack m_kFeet;
     std::vector<Vec3> m_kRoots;
     std::vector<Vec3> m_kHips;
+    std::vector<FootTouches> m_kTouches;
+    std::vector<size_t> m_kJumps;
 };
 
 } // namespace gw

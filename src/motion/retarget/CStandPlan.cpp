@@ -5,13 +5,13 @@
 //
 // So the midpoint of the hip joints follows the source's path over the ground, and the root is placed to
 // match. The source's leg directions then give the free path of each ankle. Contacts hold the foot close to
-// that path (HoldFoot) and put its sole on the floor (LandFoot). If the legs are now too short or too long,
-// the height of the hips makes up the difference: a smooth curve, fitted by least squares over all frames.
-// The ankles depend on that height, so the fit is iterated. Three rounds are enough, because each leaves only
-// a small part of the error it started with. The knee absorbs the rest, as far as it is bent and can do so
-// without a jerk (YieldKnee). What is then left between sole and floor is a few millimeters. A foot that is
-// pitched by a few degrees closes that gap with its toe, and the leg need not move. Where the foot stands is
-// then planned once more, because its toe has moved.
+// that path (StandSteps, HoldFoot) and put its sole on the floor (LandFoot). If the legs are now too short or
+// too long, the height of the hips makes up the difference: a smooth curve, fitted by least squares over all
+// frames. The ankles depend on that height, so the fit is iterated. Three rounds are enough, because each
+// leaves only a small part of the error it started with. The knee absorbs the rest, as far as it is bent and
+// can do so without a jerk (YieldKnee). What is then left between sole and floor is a few millimeters. A foot
+// that is pitched by a few degrees closes that gap with its toe, and the leg need not move. Where the foot
+// stands is then planned once more, because its toe has moved.
 
 #include "CStandPlan.h"
 
@@ -21,6 +21,7 @@
 #include "FootPitch.h"
 #include "HoldFoot.h"
 #include "LandFoot.h"
+#include "StandSteps.h"
 
 #include <algorithm>
 #include <cmath>
@@ -58,10 +59,10 @@ double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 
 CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, float lowestHand,
                        const Vec3& origin, double secondsPerFrame, bool holdFeet)
-    : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())), m_kJumps(source.Jumps()),
+    : legs_(legs), source_(source), m_fScale(ScaleOf(legs, source.LegLength())),
       m_kRoots(source.FrameCount(), kVec3Zero), m_kLifts(source.FrameCount(), 0.0f)
 {
-    const std::vector<FootTouches> touches = source.Touches(secondsPerFrame);
+    const std::vector<FootTouches>& touches = source.Touches();
     PlaceRoot(origin);
     StandOnFloor(touches, lowestHand);
     const bool stands = std::ranges::any_of(touches, [](const auto& leg) { return !leg.flat.empty(); });
@@ -70,7 +71,7 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
         return;
     for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
-        HoldLeg(leg, touches[leg].contacts, secondsPerFrame);
+        HoldLeg(leg, touches[leg], secondsPerFrame);
         LandLeg(leg, touches[leg], secondsPerFrame);
     }
     for (int round = 0; round < kRounds; ++round)
@@ -78,7 +79,7 @@ CStandPlan::CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody&
     for (size_t leg = 0; leg < legs_.size(); ++leg)
     {
         LowerToe(leg, secondsPerFrame);
-        HoldLeg(leg, touches[leg].contacts, secondsPerFrame);
+        HoldLeg(leg, touches[leg], secondsPerFrame);
     }
 }
 
@@ -158,7 +159,7 @@ std::vector<Vec3> CStandPlan::Scaled(const std::vector<Vec3>& places) const
     return scaled;
 }
 
-void CStandPlan::HoldLeg(size_t leg, const std::vector<Contact>& contacts, double secondsPerFrame)
+void CStandPlan::HoldLeg(size_t leg, const FootTouches& touches, double secondsPerFrame)
 {
     std::vector<Vec3> free;
     std::vector<Vec3> toe;
@@ -173,8 +174,10 @@ void CStandPlan::HoldLeg(size_t leg, const std::vector<Contact>& contacts, doubl
     for (size_t frame = sourceToe.size(); frame < sourceAnkle.size(); ++frame)
         sourceToe.push_back(sourceAnkle[frame] + toe[frame]);
     const double length = legs_[leg].Lengths().upper + legs_[leg].Lengths().lower;
-    const std::vector<Vec3> held =
-        HoldFoot({free, toe, sourceAnkle, sourceToe, length}, contacts, secondsPerFrame, m_kJumps);
+    const StandingFoot standing =
+        StandSteps({toe, sourceAnkle, sourceToe, length},
+                   {touches.contacts, touches.ankle, touches.toe, source_.Jumps()}, secondsPerFrame);
+    const std::vector<Vec3> held = HoldFoot(free, standing.steps, touches.contacts, secondsPerFrame);
     if (leg == m_kAnkles.size())
         m_kAnkles.push_back(held);
     for (size_t frame = 0; frame < held.size(); ++frame)

@@ -15,10 +15,10 @@ class CBandFit;
 class CStandPlan
 {
 public:
-    /// Makes the plan. `legs` must already have read all frames of source and target; `legs` and `source`
-    /// must outlive the plan. `lowestHand` is the lowest y of the source's hands. The root starts above the x
-    /// and z of `origin`. Without `holdFeet`, the legs point in the source's directions, wherever that puts
-    /// the feet.
+    /// Makes the plan. `legs` must already have read all frames of source and target, and `source` must have
+    /// found its touches; `legs` and `source` must outlive the plan. `lowestHand` is the lowest y of the
+    /// source's hands. The root starts above the x and z of `origin`. Without `holdFeet`, the legs point in
+    /// the source's directions, wherever that puts the feet.
     CStandPlan(const std::vector<CFaithfulLeg>& legs, const CSourceBody& source, float lowestHand,
                const Vec3& origin, double secondsPerFrame, bool holdFeet);
 
@@ -41,7 +41,7 @@ private:
     Vec3 FreeAnkle(size_t leg, size_t frame) const;
     float FreeSole(size_t leg, size_t frame) const;
     void StandOnFloor(const std::vector<FootTouches>& touches, float lowestHand);
-    void HoldLeg(size_t leg, const std::vector<Contact>& contacts, double secondsPerFrame);
+    void HoldLeg(size_t leg, const FootTouches& touches, double secondsPerFrame);
     SoleWish WishedSole(size_t leg, size_t frame, const FootTouches& touches) const;
     void LandLeg(size_t leg, const FootTouches& touches, double secondsPerFrame);
     void AddWish(size_t leg, size_t frame, CBandFit& lifts) const;
@@ -52,8 +52,7 @@ private:
 
     const std::vector<CFaithfulLeg>& legs_;
     const CSourceBody& source_;
-    double m_fScale;              // target lengths / source lengths
-    std::vector<size_t> m_kJumps; // frames after which the source jumps
+    double m_fScale; // target lengths / source lengths
     bool m_bHasFloor = false;
     float m_fRaised = 0.0f; // what to add to the scaled source's heights to put it on the target's floor
     std::vector<Vec3> m_kRoots;
