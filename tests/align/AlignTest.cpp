@@ -279,6 +279,29 @@ TEST(PlanAlignment, LeavesABodyThatLiesOnTheGroundLying)
     EXPECT_EQ(CountOf(corrections, ECorrection::UpAxis), 0u);
 }
 
+// The same, but the body walks: each foot stays in place for half of the steps.
+TEST(UpAxis, IsThatOfABodyThatWalksFarFromTheOrigin)
+{
+    constexpr double kReach = 0.15; // of a foot's angle, in radians
+    const Mat3 world = TurnAbout(kVec3UnitX, -90.0);
+    const CMadeBody told({.world = world});
+    Vec3* const places = told.Track("LowerTorso").m_kPositionKeys.Expand().data();
+    for (int frame = 0; frame < 40; ++frame)
+    {
+        const double swing = kReach * (std::abs(frame % 20 - 10) / 5.0 - 1.0);
+        places[frame] = Turned({0.0f, 84.0f, static_cast<float>(78.0 * kReach / 5.0 * frame)}, world) +
+                        Vec3{150, 90, 220};
+        for (const auto& [thigh, calf, angle] :
+             {std::tuple{"LThigh", "LCalf", swing}, std::tuple{"RThigh", "RCalf", -swing}})
+        {
+            told.Track(thigh).m_kRotationKeys[static_cast<size_t>(frame)] =
+                QuatFromMat3(TurnAbout(kVec3UnitX, -angle * kRadiansToDegrees64));
+            told.Track(calf).m_kRotationKeys[static_cast<size_t>(frame)] = QuatFromMat3(kMat3Identity);
+        }
+    }
+    EXPECT_EQ(FindUpAxis(told.Motion().body, told.Motion().frequency, 40), -kVec3UnitZ);
+}
+
 TEST(PlanAlignment, RefusesWhatIsNoBody)
 {
     const CMadeBody told{Telling()};

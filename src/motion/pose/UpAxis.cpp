@@ -3,6 +3,11 @@
 // stands most of the time. If the body is upside down for part of the motion, as in a cartwheel, that mean is
 // short. Then the frames decide in which both trunk and legs are along one axis, provided that few are along
 // +Y.
+//
+// If the rest pose stands along +Y and the motion is along another axis, the body may as well lie on the
+// ground. It does not if its feet are on the plane through the origin. In a recording whose floor is
+// somewhere else, it does not if it walks: the hips of a lying body do not get far while a foot stays in
+// place.
 
 #include "UpAxis.h"
 
@@ -12,6 +17,7 @@
 #include "Directions.h"
 
 #include <algorithm>
+#include <array>
 #include <cmath>
 #include <cstdint>
 #include <iterator>
@@ -25,11 +31,19 @@ constexpr int kSamples = 64;
 // Minimum component of the trunk's mean direction along the axis: the cosine of the largest lean. If the body
 // tumbles, the mean is shorter than a unit vector and fails this too.
 constexpr double kUpright = 0.8;
-// Stricter limits for a motion whose zero pose stands along Y: the same minimum, for trunk and legs, and the
-// largest distance of the mean foot position from height 0, in leg lengths. The feet of a body that lies on
-// the ground are not near the plane through the origin.
+// Stricter limits for a motion whose zero pose stands along Y: the same minimum, for the mean of trunk and
+// legs, and the largest distance of the mean foot position from height 0, in leg lengths. The feet of a body
+// that lies on the ground are not near the plane through the origin.
 constexpr double kSurelyUpright = 0.9;
 constexpr double kNearFloor = 0.25;
+// For a body that walks: the seconds between two positions of a joint, the largest movement of a foot that
+// stays in place and the smallest of the hips, as shares of the hips' movement and of a leg, and the minimum
+// share of such frames. The hips must get half a leg away.
+constexpr double kStepSeconds = 0.1;
+constexpr double kStaying = 0.25;
+constexpr double kMoving = 0.03;
+constexpr double kWalkingShare = 0.15;
+constexpr double kWalkingReach = 0.5;
 // For a body that tumbles: the minimum share of frames that stand along the axis, and how many times as many
 // they must be as those along +Y.
 constexpr double kTumblingShare = 0.2;
@@ -99,12 +113,6 @@ Bearing MeanOf(const std::vector<Bearing>& bearings)
     return mean;
 }
 
-bool SurelyStandsAlong(const Vec3& axis, const Bearing& bearing)
-{
-    return Vec3Dot(axis, bearing.trunk) >= kSurelyUpright && Vec3Dot(axis, bearing.legs) >= kSurelyUpright &&
-           std::fabs(Vec3Dot(axis, bearing.feet)) <= kNearFloor;
-}
-
 bool HasTrunkAlong(const Vec3& axis, const Bearing& bearing)
 {
     return Vec3Dot(axis, bearing.trunk) >= kUpright;
@@ -113,6 +121,59 @@ bool HasTrunkAlong(const Vec3& axis, const Bearing& bearing)
 bool StandsAlong(const Vec3& axis, const Bearing& bearing)
 {
     return HasTrunkAlong(axis, bearing) && Vec3Dot(axis, bearing.legs) >= kUpright;
+}
+
+bool IsSurelyAlong(const Vec3& axis, const Bearing& bearing)
+{
+    return StandsAlong(axis, bearing) && Vec3Dot(axis, bearing.trunk + bearing.legs) * 0.5 >= kSurelyUpright;
+}
+
+bool SurelyStandsAlong(const Vec3& axis, const Bearing& bearing)
+{
+    return IsSurelyAlong(axis, bearing) && std::fabs(Vec3Dot(axis, bearing.feet)) <= kNearFloor;
+}
+
+// Where hips and feet are at a time. A missing foot is at the hips, so it never stays behind.
+using Places = std::array<Vec3, 3>;
+
+Places PlacesOf(const CBodyMap& body)
+{
+    Places places;
+    places.fill(PlaceOf(*body.hip));
+    for (const EBodySide side : kBodySides)
+    {
+        if (const CNode* const foot = body.Leg(side).foot)
+            places[1 + static_cast<size_t>(side)] = PlaceOf(*foot);
+    }
+    return places;
+}
+
+// Returns whether the body moves along the plane perpendicular to an axis while one of its feet stays.
+bool WalksAcross(const Vec3& axis, const CBodyMap& body, float frequency, int frameCount)
+{
+    const double leg = LegLength(body);
+    CPoseSampler sampler(frequency);
+    for (CNode* joint : {body.hip, body.Leg(EBodySide::Left).foot, body.Leg(EBodySide::Right).foot})
+        sampler.Watch(joint);
+    const double step = IsFrameTime(frequency) ? std::max(1.0, std::round(kStepSeconds / frequency)) : 1.0;
+    const int count = std::min(frameCount, kSamples);
+    int walking = 0;
+    double reach = 0.0;
+    Vec3 start = kVec3Zero;
+    for (int i = 0; i < count; ++i)
+    {
+        const double frame = static_cast<double>(frameCount) * i / count;
+        sampler.Pose(frame);
+        const Places from = PlacesOf(body);
+        sampler.Pose(frame + step);
+        const Places to = PlacesOf(body);
+        start = i == 0 ? from[0] : start;
+        reach = std::max<double>(reach, Vec3Length(Across(from[0] - start, axis)));
+        const double hips = Vec3Length(Across(to[0] - from[0], axis));
+        const double foot = std::min(Vec3Length(to[1] - from[1]), Vec3Length(to[2] - from[2]));
+        walking += hips >= kMoving * leg && foot <= kStaying * hips ? 1 : 0;
+    }
+    return reach >= kWalkingReach * leg && walking >= kWalkingShare * count;
 }
 
 // Returns the up axis of a body that stands along one axis for part of the motion and tumbles for the rest. A
@@ -147,8 +208,11 @@ Vec3 FindUpAxis(const CBodyMap& body, float frequency, int frameCount)
     if (mean.trunk == kVec3Zero)
         return isStance ? restUp : kVec3UnitY;
     const Vec3 axis = NearestAxis(mean.trunk);
-    const bool stands = restUp == kVec3UnitY ? SurelyStandsAlong(axis, mean) : HasTrunkAlong(axis, mean);
-    return stands ? axis : FindAxisOfTumbling(bearings, restUp);
+    if (restUp != kVec3UnitY ? HasTrunkAlong(axis, mean) : SurelyStandsAlong(axis, mean))
+        return axis;
+    if (axis != kVec3UnitY && IsSurelyAlong(axis, mean) && WalksAcross(axis, body, frequency, frameCount))
+        return axis;
+    return FindAxisOfTumbling(bearings, restUp);
 }
 
 } // namespace gw
