@@ -84,76 +84,101 @@ TEST(CTrunkAim, LineFromHipsToNeckFollowsTheSourcesAsAtRestAndTheHeadKeepsItsTur
               0.05);
 }
 
+constexpr LegLengths kArm{280.0, 260.0};
+
 // A body that sits with its thighs along z; its hands are far from everything.
-TouchPoints Sitting()
+ArmPoints Sitting()
 {
-    TouchPoints body;
+    ArmPoints body;
     for (size_t side = 0; side < 2; ++side)
     {
         const float x = side == 0 ? 1.0f : -1.0f;
         body.hips[side] = {95.0f * x, 450.0f, 0.0f};
         body.knees[side] = {95.0f * x, 450.0f, 360.0f};
         body.hands[side] = {400.0f * x, 700.0f, 200.0f};
+        body.collars[side] = {25.0f * x, 1000.0f, 0.0f};
+        body.shoulders[side] = {170.0f * x, 1000.0f, 0.0f};
     }
     body.neck = {0.0f, 1090.0f, 0.0f};
-    body.head = {0.0f, 1290.0f, 0.0f};
+    body.head = {0.0f, 1190.0f, 0.0f};
     return body;
+}
+
+Vec3 HandAfter(const ArmPoints& body, size_t side, const ArmTurn& turn)
+{
+    const Vec3& collar = body.collars[side];
+    const Vec3& shoulder = body.shoulders[side];
+    return collar + TurnedCollar(shoulder - collar, body.chestUp, turn) +
+           TurnedHand(kArm, body.hands[side] - shoulder, turn);
+}
+
+// Both bodies keep their poses for so long that the hands of the target have time to get anywhere.
+CHandPlan SolvedPlan(const TouchPoints& source, const ArmPoints& target, double secondsPerFrame)
+{
+    CHandPlan plan({kArm, kArm}, 40, secondsPerFrame, true);
+    for (size_t sample = 0; sample < plan.SampleCount(); ++sample)
+        plan.Add(sample, source, target);
+    plan.Solve();
+    return plan;
 }
 
 TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
 {
-    const Vec3 free{95.0f, 420.0f, 480.0f}; // past the knee and below it
-    // hands of the source; left: the gap of the first one to what it touches
-    const std::tuple<const char*, Vec3, Vec3, double> rows[] = {
-        {"on a thigh", {95.0f, 510.0f, 250.0f}, {-400.0f, 700.0f, 200.0f}, 60.0},
-        {"on the floor", {400.0f, 40.0f, 250.0f}, {-400.0f, 700.0f, 200.0f}, 40.0},
-        {"that clap", {30.0f, 900.0f, 400.0f}, {-30.0f, 900.0f, 400.0f}, 60.0},
-        {"at the head", {0.0f, 1290.0f, 90.0f}, {-400.0f, 700.0f, 200.0f}, 90.0},
-        {"far from it all", {400.0f, 700.0f, 400.0f}, {-400.0f, 700.0f, 200.0f}, -1.0},
+    const Vec3 away{-400.0f, 700.0f, 200.0f};
+    const Vec3 overThigh{95.0f, 600.0f, 330.0f};
+    // hands of the source and the target's left hand; left: the gap of the first one to what it touches
+    const std::tuple<const char*, Vec3, Vec3, Vec3, double> rows[] = {
+        {"on a thigh", {95.0f, 510.0f, 250.0f}, away, overThigh, 60.0},
+        {"on the floor", {400.0f, 40.0f, 250.0f}, away, {170.0f, 160.0f, 100.0f}, 40.0},
+        {"that clap", {30.0f, 900.0f, 400.0f}, {-30.0f, 900.0f, 400.0f}, overThigh, 60.0},
+        {"at the head", {0.0f, 1297.0f, 90.0f}, away, {60.0f, 1200.0f, 240.0f}, 90.0},
+        {"far from it all", {400.0f, 700.0f, 400.0f}, away, overThigh, -1.0},
     };
-    for (size_t touched = 0; const auto& [what, leftHand, rightHand, left] : rows)
+    for (size_t touched = 0; const auto& [what, leftHand, rightHand, free, left] : rows)
     {
         SCOPED_TRACE(what);
-        TouchPoints source = Sitting();
-        TouchPoints target = source;
+        ArmPoints target = Sitting();
+        TouchPoints source = target;
         source.hands = {leftHand, rightHand};
-        target.hands[0] = free;
-        CHandPlan plan(40, 1.0 / 30.0, true);
-        for (size_t frame = 0; frame < 40; ++frame)
-            plan.Add(frame, source, target);
-        plan.Solve();
-        EXPECT_EQ(plan.Touches(source), left >= 0.0);
-        const Vec3 hand = free + plan.Way(0, 20);
-        const Vec3 other = target.hands[1] + plan.Way(1, 20);
-        const Vec3 along = hand - Vec3{95.0f, 450.0f, std::min(hand.z, 360.0f)};
-        const double gaps[] = {Vec3Length(along), static_cast<double>(hand.y), Vec3Length(hand - other),
-                               Vec3Length(hand - target.head)};
-        if (left >= 0.0)
-            EXPECT_NEAR(gaps[touched++], left, 25.0) << "of 120 and more";
-        else
-            EXPECT_EQ(Vec3Length(plan.Way(0, 20)), 0.0);
+        target.hands = {free, {-60.0f, 700.0f, 330.0f}};
+        if (free.y < 200.0f) // bent over
+            target.collars[0].y = target.shoulders[0].y = 500.0f;
+        for (const double rate : {30.0, 120.0}) // at the second one, most frames lie between samples
+        {
+            const CHandPlan plan = SolvedPlan(source, target, 1.0 / rate);
+            EXPECT_EQ(plan.Touches(source), left >= 0.0);
+            const Vec3 hand = HandAfter(target, 0, plan.Turn(0, 19));
+            const Vec3 other = HandAfter(target, 1, plan.Turn(1, 19));
+            const Vec3 thigh = hand - Vec3{95.0f, 450.0f, std::min(hand.z, 360.0f)};
+            const double gaps[] = {Vec3Length(thigh), static_cast<double>(hand.y), Vec3Length(hand - other),
+                                   Vec3Length(hand - target.head - Vec3{0.0f, 107.0f, 0.0f})};
+            if (left >= 0.0)
+                EXPECT_NEAR(gaps[touched], left, 20.0) << "of 120 and more";
+            else
+                EXPECT_LT(Vec3Length(hand - free), 0.01);
+        }
+        ++touched;
     }
 }
 
-// The wanted place is 60 mm above the thigh, 250 mm ahead of the hip, but the arm ends before it.
-TEST(CHandPlan, HandOutOfReachGoesToAnotherPlaceOnTheThigh)
+// The straight arm ends above the thigh, where no rotation takes it to the source's gap.
+TEST(CHandPlan, ShoulderLowersAHandThatHangsAboveTheThigh)
 {
-    TouchPoints source = Sitting();
-    source.hands[0] = {95.0f, 510.0f, 250.0f};
-    TouchPoints target = source;
-    target.hands[0] = {95.0f, 590.0f, 250.0f};
-    target.shoulders[0] = {95.0f, 1000.0f, 0.0f};
-    target.reach[0] = 510.0;
-    CHandPlan plan(40, 1.0 / 30.0, true);
-    for (size_t frame = 0; frame < 40; ++frame)
-        plan.Add(frame, source, target);
-    plan.Solve();
-    const Vec3 hand = target.hands[0] + plan.Way(0, 20);
-    EXPECT_NEAR(hand.y - 450.0f, 60.0f, 10.0f);
-    EXPECT_NEAR(Vec3Length(hand - target.shoulders[0]), 510.0, 5.0);
+    ArmPoints target = Sitting();
+    TouchPoints source = target;
+    source.hands[0] = {130.0f, 450.0f, 20.0f};
+    target.shoulders[0] = {130.0f, 1090.0f, 0.0f};
+    target.collars[0] = {-15.0f, 1090.0f, 0.0f};
+    target.hands[0] = {130.0f, 551.0f, 0.0f};
+    const CHandPlan plan = SolvedPlan(source, target, 1.0 / 30.0);
+    const ArmTurn turn = plan.Turn(0, 20);
+    EXPECT_LT(turn.raise, -0.1);
+    EXPECT_GT(turn.raise, -0.5);
+    EXPECT_LT(Vec3Length(HandAfter(target, 0, turn) - target.hips[0]),
+              Vec3Length(target.hands[0] - target.hips[0]) - 15.0);
 }
 
-TEST(CFaithfulArm, HandGoesItsWayAndTheElbowStaysOnItsSide)
+TEST(CFaithfulArm, HandFollowsTheTurnAndTheElbowStaysOnItsSide)
 {
     const Ref<CNode> source = Standing(MakeTarget());
     const Ref<CNode> target = Standing(MakeTarget());
@@ -180,14 +205,19 @@ TEST(CFaithfulArm, HandGoesItsWayAndTheElbowStaysOnItsSide)
         tracks.push_back(kept.back().Get());
     }
     arm->ReadPose(matcher);
-    const Vec3 way{-40.0f, -30.0f, 20.0f};
-    arm->MoveHand(matcher, way, 0, tracks);
+    const Vec3 shoulder = arm->Shoulder(matcher);
+    const Vec3 collar = arm->Collar(matcher);
+    const ArmTurn turn{{0.05f, -0.1f, 0.15f}, 0.2, -0.1};
+    const Vec3 goal = collar + TurnedCollar(shoulder - collar, arm->ChestUp(matcher), turn) +
+                      TurnedHand(arm->Lengths(), hand - shoulder, turn);
+    arm->Turn(matcher, turn, 0, tracks);
     for (size_t bone = 0; bone < matcher.Bones().size(); ++bone)
     {
         matcher.Bones()[bone].rotation = QuatToMat3(tracks[bone]->m_kRotationKeys[0]);
         matcher.UpdateWorld(bone);
     }
-    EXPECT_LT(Vec3Length(matcher.Bones()[arm->Hand()].world.Translation() - hand - way), 2.0);
+    EXPECT_LT(Vec3Length(matcher.Bones()[arm->Hand()].world.Translation() - goal), 0.01);
+    EXPECT_GT(Vec3Length(goal - hand), 50.0);
     EXPECT_LT(Vec3Length(matcher.Bones()[bent].world.Translation() - elbow), 60.0)
         << "not the other way round";
 }

@@ -31,6 +31,11 @@ double CLegTrack::AnkleHeight() const
     return Vec3Length(m_kHeelSole);
 }
 
+double CLegTrack::ToeHeight() const
+{
+    return Vec3Length(m_kToeSole);
+}
+
 Vec3 CLegTrack::Heading() const
 {
     if (HasToe())

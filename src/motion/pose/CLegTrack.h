@@ -42,6 +42,8 @@ public:
     /// Returns the height of the ankle above the sole in the rest pose; 0 for a skeleton that ends at its
     /// ankles.
     double AnkleHeight() const;
+    /// Same for the toe; 0 for a skeleton without toes, or one that ends at them.
+    double ToeHeight() const;
     /// Returns the unit direction of the foot in the current pose, in world space.
     Vec3 Heading() const;
     /// Defines where a foot without a toe joint points: in the current pose, in `direction` (world space).

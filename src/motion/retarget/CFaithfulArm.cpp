@@ -17,18 +17,6 @@ namespace {
 // How much the elbow's usual side counts, in millimeters. It decides for a straight arm; the elbow of a bent
 // one is ten times farther from the line.
 constexpr float kUsualSide = 5.0f;
-// A straighter arm yields little, so a hand does not get where it should with one.
-constexpr double kComfortable = 0.95;
-
-Vec3 PlaceOfBone(const CPoseMatcher& matcher, size_t bone)
-{
-    return matcher.Bones()[bone].world.Translation();
-}
-
-Mat3 TurnOfBone(const CPoseMatcher& matcher, size_t bone)
-{
-    return NormalizedRows(matcher.Bones()[bone].world);
-}
 
 } // namespace
 
@@ -48,62 +36,75 @@ std::optional<CFaithfulArm> CFaithfulArm::Plan(const CRetargeter& retargeter, co
         return std::nullopt;
     for (const CNode* node = hand; node && matcher.IndexOf(node) >= 0; node = node->GetParentNode())
         arm.m_kPath.push_back(static_cast<size_t>(matcher.IndexOf(node)));
+    if (arm.m_kPath.size() < kBoneCount)
+        return std::nullopt;
     std::ranges::reverse(arm.m_kPath);
     arm.m_kLengths = {Vec3Length(forearm->m_kMatrix.Translation()),
                       Vec3Length(hand->m_kMatrix.Translation())};
     return arm;
 }
 
-Vec3 CFaithfulArm::Shoulder(const CPoseMatcher& matcher) const
+Vec3 CFaithfulArm::Place(const CPoseMatcher& matcher, EBone bone) const
 {
-    return PlaceOfBone(matcher, m_kPath[m_kPath.size() - 3]);
+    return matcher.Bones()[Bone(bone)].world.Translation();
 }
 
-double CFaithfulArm::Reach() const
+Mat3 CFaithfulArm::Rotation(const CPoseMatcher& matcher, EBone bone) const
 {
-    return kComfortable * (m_kLengths.upper + m_kLengths.lower);
+    return NormalizedRows(matcher.Bones()[Bone(bone)].world);
+}
+
+Vec3 CFaithfulArm::Collar(const CPoseMatcher& matcher) const
+{
+    return Place(matcher, kCollarBone);
+}
+
+Vec3 CFaithfulArm::Shoulder(const CPoseMatcher& matcher) const
+{
+    return Place(matcher, kUpperArmBone);
+}
+
+Vec3 CFaithfulArm::ChestUp(const CPoseMatcher& matcher) const
+{
+    return Rotation(matcher, kChestBone).Row(1);
 }
 
 // Returns the elbow's offset from the line between shoulder and hand.
 Vec3 CFaithfulArm::Pole(const CPoseMatcher& matcher) const
 {
-    const size_t last = m_kPath.size() - 1;
-    const Vec3 shoulder = PlaceOfBone(matcher, m_kPath[last - 2]);
-    const Vec3 line = Vec3Normalized(PlaceOfBone(matcher, m_kPath[last]) - shoulder);
-    return Across(PlaceOfBone(matcher, m_kPath[last - 1]) - shoulder, line);
+    const Vec3 shoulder = Place(matcher, kUpperArmBone);
+    const Vec3 line = Vec3Normalized(Place(matcher, kHandBone) - shoulder);
+    return Across(Place(matcher, kForearmBone) - shoulder, line);
 }
 
 void CFaithfulArm::ReadPose(const CPoseMatcher& matcher)
 {
-    m_kBend = m_kBend + ToLocal(Pole(matcher), TurnOfBone(matcher, m_kPath[m_kPath.size() - 3]));
+    m_kBend = m_kBend + ToLocal(Pole(matcher), Rotation(matcher, kUpperArmBone));
 }
 
-void CFaithfulArm::MoveHand(const CPoseMatcher& matcher, const Vec3& way, size_t frame,
-                            const std::vector<CKeyframeControl*>& tracks) const
+void CFaithfulArm::Turn(const CPoseMatcher& matcher, const ArmTurn& turn, size_t frame,
+                        const std::vector<CKeyframeControl*>& tracks) const
 {
-    const size_t last = m_kPath.size() - 1;
-    const size_t upperArm = m_kPath[last - 2];
-    const size_t forearm = m_kPath[last - 1];
-    const size_t hand = m_kPath[last];
-    const Vec3 shoulder = PlaceOfBone(matcher, upperArm);
-    const Vec3 free = PlaceOfBone(matcher, hand) - shoulder;
-    const Vec3 asked = free + way;
-    const double bend = BendAt(m_kLengths, Vec3Length(free));
-    const double reach =
-        ReachAt(m_kLengths, YieldingBend(m_kLengths, Vec3Length(asked), bend, kElbowStiffness));
-    const Vec3 goal = Vec3Normalized(asked) * static_cast<float>(reach);
-    const Vec3 usual = Vec3Normalized(Turned(m_kBend, TurnOfBone(matcher, upperArm))) * kUsualSide;
-    const Vec3 elbow = MiddleJoint(m_kLengths, goal, Pole(matcher) + usual);
+    const Vec3 shoulder = Place(matcher, kUpperArmBone);
+    const Vec3 usual = Vec3Normalized(Turned(m_kBend, Rotation(matcher, kUpperArmBone))) * kUsualSide;
+    const Vec3 goal = TurnedHand(m_kLengths, Place(matcher, kHandBone) - shoulder, turn);
+    const Vec3 elbow = MiddleJoint(m_kLengths, goal, Rotated(Pole(matcher) + usual, turn.turn));
     if (!std::isfinite(Vec3Dot(elbow, elbow)))
         return;
     const auto& bones = matcher.Bones();
-    const Mat3 above = TurnOfBone(matcher, m_kPath[last - 3]);
-    const Mat3 upper = PointedTo(elbow, TurnOfBone(matcher, upperArm), bones[forearm].translation);
-    const Mat3 lower = PointedTo(goal - elbow, TurnOfBone(matcher, forearm), bones[hand].translation);
-    const Mat3 palm = TurnOfBone(matcher, hand);
-    tracks[upperArm]->m_kRotationKeys[frame] = QuatFromMat3(upper * Mat3Transpose(above));
-    tracks[forearm]->m_kRotationKeys[frame] = QuatFromMat3(lower * Mat3Transpose(upper));
-    tracks[hand]->m_kRotationKeys[frame] = QuatFromMat3(palm * Mat3Transpose(lower));
+    const Mat3 chest = Rotation(matcher, kChestBone);
+    const Vec3 collarWay = TurnedCollar(shoulder - Place(matcher, kCollarBone), chest.Row(1), turn);
+    const Mat3 collar =
+        PointedTo(collarWay, Rotation(matcher, kCollarBone), bones[Bone(kUpperArmBone)].translation);
+    const Mat3 upper =
+        PointedTo(elbow, Rotation(matcher, kUpperArmBone), bones[Bone(kForearmBone)].translation);
+    const Mat3 lower =
+        PointedTo(goal - elbow, Rotation(matcher, kForearmBone), bones[Bone(kHandBone)].translation);
+    const Mat3 palm = Rotation(matcher, kHandBone);
+    tracks[Bone(kCollarBone)]->m_kRotationKeys[frame] = QuatFromMat3(collar * Mat3Transpose(chest));
+    tracks[Bone(kUpperArmBone)]->m_kRotationKeys[frame] = QuatFromMat3(upper * Mat3Transpose(collar));
+    tracks[Bone(kForearmBone)]->m_kRotationKeys[frame] = QuatFromMat3(lower * Mat3Transpose(upper));
+    tracks[Bone(kHandBone)]->m_kRotationKeys[frame] = QuatFromMat3(palm * Mat3Transpose(lower));
 }
 
 } // namespace gw

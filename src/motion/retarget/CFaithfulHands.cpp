@@ -7,27 +7,34 @@
 #include "Skeleton.h"
 
 #include <algorithm>
+#include <cmath>
+#include <iterator>
 #include <limits>
+#include <utility>
 
 namespace gw {
 
 namespace {
 
-constexpr float kHeadMiddle = 100.0f; // millimeters from the head's joint, in the neck's direction
-constexpr double kLeastWay = 0.05;    // in millimeters; smaller corrections are skipped
+constexpr double kLeastTurn = 1e-4; // in radians; smaller turns are skipped
+
+constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
+constexpr Vec3 kNowhere{kNaN, kNaN, kNaN}; // of a joint that is missing: nothing touches it
 
 // Sorts the eight positions of a body by what they mean to its hands.
 TouchPoints PointsOf(const Vec3* places)
 {
-    const Vec3& neck = places[6];
-    const Vec3& head = places[7];
-    TouchPoints points;
-    points.hands = {places[0], places[1]};
-    points.hips = {places[2], places[3]};
-    points.knees = {places[4], places[5]};
-    points.neck = neck;
-    points.head = head + Vec3Normalized(head - neck) * kHeadMiddle;
-    return points;
+    return {
+        {places[0], places[1]},
+        {places[2], places[3]},
+        {places[4], places[5]},
+        places[6], places[7]
+    };
+}
+
+double SizeOf(const ArmTurn& turn)
+{
+    return Vec3Length(turn.turn) + std::fabs(turn.bend) + std::fabs(turn.raise);
 }
 
 } // namespace
@@ -36,9 +43,9 @@ CFaithfulHands::CFaithfulHands(const CRetargeter& retargeter, CPoseMatcher& matc
                                const std::vector<CFaithfulLeg>& legs)
     : matcher_(matcher)
 {
-    CNode* const neck = FindNode(targetRoot, kNeckBone);
-    CNode* const head = FindNode(targetRoot, kHeadBone);
-    if (!targetRoot || legs.size() != 2 || !retargeter.SourceOf(neck) || !retargeter.SourceOf(head))
+    const CNode* neck = FindNode(targetRoot, kNeckBone);
+    const CNode* head = FindNode(targetRoot, kHeadBone);
+    if (!neck || !head || legs.size() != 2)
         return;
     for (const HostSide& side : kHostSides)
     {
@@ -50,13 +57,25 @@ CFaithfulHands::CFaithfulHands(const CRetargeter& retargeter, CPoseMatcher& matc
         m_kArms.clear();
         return;
     }
-    m_kSource = {m_kArms[0].SourceHand(),   m_kArms[1].SourceHand(),  legs[0].Source().thigh,
-                 legs[1].Source().thigh,    legs[0].Source().knee,    legs[1].Source().knee,
-                 retargeter.SourceOf(neck), retargeter.SourceOf(head)};
-    PlanBones(legs, static_cast<size_t>(matcher.IndexOf(neck)), static_cast<size_t>(matcher.IndexOf(head)));
+    CNode* sourceNeck = retargeter.SourceOf(neck);
+    CNode* sourceHead = retargeter.SourceOf(head);
+    if (!sourceNeck)
+    {
+        neck = head;
+        sourceNeck = std::exchange(sourceHead, nullptr);
+    }
+    m_kSource = {m_kArms[0].SourceHand(),
+                 m_kArms[1].SourceHand(),
+                 legs[0].Source().thigh,
+                 legs[1].Source().thigh,
+                 legs[0].Source().knee,
+                 legs[1].Source().knee,
+                 sourceNeck,
+                 sourceHead};
+    PlanBones(legs, neck, head);
 }
 
-void CFaithfulHands::PlanBones(const std::vector<CFaithfulLeg>& legs, size_t neck, size_t head)
+void CFaithfulHands::PlanBones(const std::vector<CFaithfulLeg>& legs, const CNode* neck, const CNode* head)
 {
     m_kJoints = {m_kArms[0].Hand(),
                  m_kArms[1].Hand(),
@@ -64,8 +83,8 @@ void CFaithfulHands::PlanBones(const std::vector<CFaithfulLeg>& legs, size_t nec
                  legs[1].Thigh(),
                  legs[0].Calf(),
                  legs[1].Calf(),
-                 neck,
-                 head};
+                 static_cast<size_t>(matcher_.IndexOf(neck)),
+                 static_cast<size_t>(matcher_.IndexOf(head))};
     std::vector<bool> looked(matcher_.Bones().size(), false);
     for (const size_t joint : m_kJoints)
     {
@@ -82,13 +101,15 @@ void CFaithfulHands::PlanBones(const std::vector<CFaithfulLeg>& legs, size_t nec
 
 std::vector<CNode*> CFaithfulHands::Joints() const
 {
-    return m_kSource;
+    std::vector<CNode*> joints;
+    std::ranges::copy_if(m_kSource, std::back_inserter(joints), [](const CNode* joint) { return joint; });
+    return joints;
 }
 
 void CFaithfulHands::Append()
 {
     for (const CNode* joint : m_kSource)
-        m_kPlaces.push_back(PlaceOf(*joint));
+        m_kPlaces.push_back(joint ? PlaceOf(*joint) : kNowhere);
 }
 
 float CFaithfulHands::LowestHand() const
@@ -122,16 +143,16 @@ void CFaithfulHands::PoseFrame(size_t frame, const std::vector<CKeyframeControl*
     }
 }
 
-TouchPoints CFaithfulHands::TargetPoints() const
+ArmPoints CFaithfulHands::TargetPoints() const
 {
     Vec3 places[kJoints];
     std::ranges::transform(m_kJoints, places,
                            [&](size_t bone) { return matcher_.Bones()[bone].world.Translation(); });
-    TouchPoints points = PointsOf(places);
+    ArmPoints points{PointsOf(places), {}, {}, m_kArms[0].ChestUp(matcher_)};
     for (size_t side = 0; side < m_kArms.size(); ++side)
     {
+        points.collars[side] = m_kArms[side].Collar(matcher_);
         points.shoulders[side] = m_kArms[side].Shoulder(matcher_);
-        points.reach[side] = m_kArms[side].Reach();
     }
     return points;
 }
@@ -140,18 +161,21 @@ void CFaithfulHands::Plan(const std::vector<CKeyframeControl*>& tracks,
                           const std::function<Vec3(const Vec3&)>& onTarget, double secondsPerFrame,
                           bool hasFloor)
 {
-    const size_t frameCount = m_kPlaces.size() / kJoints;
-    CHandPlan plan(frameCount, secondsPerFrame, hasFloor);
+    const size_t frameCount = m_kArms.empty() ? 0 : m_kPlaces.size() / kJoints;
+    if (frameCount == 0)
+        return;
+    CHandPlan plan({m_kArms[0].Lengths(), m_kArms[1].Lengths()}, frameCount, secondsPerFrame, hasFloor);
     bool touches = false;
-    for (size_t frame = 0; frame < frameCount; ++frame)
+    for (size_t sample = 0; sample < plan.SampleCount(); ++sample)
     {
+        const size_t frame = plan.FrameOf(sample);
         const TouchPoints source = SourceAt(frame, onTarget);
         if (!plan.Touches(source))
             continue;
         PoseFrame(frame, tracks);
         for (CFaithfulArm& arm : m_kArms)
             arm.ReadPose(matcher_);
-        plan.Add(frame, source, TargetPoints());
+        plan.Add(sample, source, TargetPoints());
         touches = true;
     }
     if (!touches)
@@ -162,11 +186,17 @@ void CFaithfulHands::Plan(const std::vector<CKeyframeControl*>& tracks,
 
 void CFaithfulHands::WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
-    if (!plan_ || std::max(Vec3Length(plan_->Way(0, frame)), Vec3Length(plan_->Way(1, frame))) < kLeastWay)
+    if (!plan_)
+        return;
+    const ArmTurn turns[] = {plan_->Turn(0, frame), plan_->Turn(1, frame)};
+    if (std::max(SizeOf(turns[0]), SizeOf(turns[1])) < kLeastTurn)
         return;
     PoseFrame(frame, tracks);
     for (size_t side = 0; side < m_kArms.size(); ++side)
-        m_kArms[side].MoveHand(matcher_, plan_->Way(side, frame), frame, tracks);
+    {
+        if (SizeOf(turns[side]) >= kLeastTurn)
+            m_kArms[side].Turn(matcher_, turns[side], frame, tracks);
+    }
 }
 
 } // namespace gw

@@ -16,8 +16,8 @@ namespace gw {
 class CFaithfulHands
 {
 public:
-    /// Plans both arms, or neither if there is no root or if an arm, a leg, the neck or the head is not
-    /// mapped. Both trees must be in rest pose.
+    /// Plans both arms, or neither if there is no root or if an arm or a leg is not mapped. Without a mapped
+    /// neck, the trunk ends at the head. Both trees must be in rest pose.
     CFaithfulHands(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot,
                    const std::vector<CFaithfulLeg>& legs);
 
@@ -35,16 +35,16 @@ public:
     void WriteFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
 
 private:
-    void PlanBones(const std::vector<CFaithfulLeg>& legs, size_t neck, size_t head);
+    void PlanBones(const std::vector<CFaithfulLeg>& legs, const CNode* neck, const CNode* head);
     TouchPoints SourceAt(size_t frame, const std::function<Vec3(const Vec3&)>& onTarget) const;
     void PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
-    TouchPoints TargetPoints() const;
+    ArmPoints TargetPoints() const;
 
     static constexpr size_t kJoints = 8;
 
     CPoseMatcher& matcher_;
     std::vector<CFaithfulArm> m_kArms;
-    std::vector<CNode*> m_kSource; // hands, hips, knees, neck, head
+    std::vector<CNode*> m_kSource; // hands, hips, knees, neck, head; null if the neck or head is missing
     std::vector<size_t> m_kJoints; // the target's bones, in the same order
     std::vector<size_t> m_kBones;  // m_kJoints and all bones above them; parents first
     std::vector<Vec3> m_kPlaces;   // positions of m_kSource, kJoints per frame

@@ -5,6 +5,7 @@
 
 #include <algorithm>
 #include <cmath>
+#include <limits>
 
 namespace gw {
 
@@ -62,6 +63,20 @@ void CSourceBody::Append()
 bool CSourceBody::HasLegs() const
 {
     return LegLength() > 0.0 && std::isfinite(LegLength());
+}
+
+float CSourceBody::Floor(double leastToe) const
+{
+    std::vector<float> soles;
+    for (const CLegTrack& leg : m_kFeet.Legs())
+    {
+        const auto ankle = static_cast<float>(leg.AnkleHeight());
+        const auto toe = static_cast<float>(std::max(leg.ToeHeight(), leastToe));
+        for (size_t frame = 0; frame < leg.Toes().size(); ++frame)
+            soles.push_back(std::min(leg.Ankles()[frame].y - ankle, leg.Toes()[frame].y - toe));
+    }
+    return soles.empty() ? std::numeric_limits<float>::quiet_NaN()
+                         : Percentile(std::move(soles), kFloorShare);
 }
 
 void CSourceBody::FindTouches(double secondsPerFrame)

@@ -30,6 +30,10 @@ public:
     const Vec3& Hips(size_t frame) const { return m_kHips[frame]; }
     const CLegTrack& Leg(size_t leg) const { return m_kFeet.Legs()[leg]; }
 
+    /// Returns the level on which the soles stand, in the source's units; NaN for a skeleton without toes.
+    /// Toe joints are at least `leastToe` above their soles.
+    float Floor(double leastToe) const;
+
     /// Finds when the feet touch the floor and where the source jumps. Call it after the last frame; what
     /// follows needs it.
     void FindTouches(double secondsPerFrame);

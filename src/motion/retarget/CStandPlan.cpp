@@ -37,6 +37,7 @@ constexpr double kRestWeight = 1e-4;    // weight of no lift at all; a standing 
 constexpr double kLiftLimit = 150.0;    // a source that needs more does not stand on a single floor
 constexpr double kMissed = 8.0;         // a standing foot whose sole is off by this much counts twice
 constexpr float kWristHeight = 30.0f;   // of a hand that is flat on the floor
+constexpr double kLeastToe = 10.0;      // from a source's toe joint down to its sole
 constexpr double kMostToeTurn = 0.08;   // radians; a toe end that is farther from the floor is left there
 constexpr double kToeReach = 10.0;      // beyond that, over which a toe end is pulled less and less
 constexpr double kToeWeight = 20.0;     // weight of a toe end on the floor; the foot's own pitch has weight 1
@@ -143,6 +144,9 @@ void CStandPlan::StandOnFloor(const std::vector<FootTouches>& touches, float low
     for (Vec3& root : m_kRoots)
         root.y += lift;
     m_fRaised = lift - source_.Hips(0).y * static_cast<float>(m_fScale);
+    const float floor = source_.Floor(kLeastToe / m_fScale);
+    if (!standing.empty() && std::isfinite(floor))
+        m_fRaised = -floor * static_cast<float>(m_fScale);
 }
 
 Vec3 CStandPlan::OnTarget(const Vec3& place) const

@@ -20,6 +20,7 @@
 
 #include "StandSteps.h"
 
+#include "Figures.h"
 #include "SmoothCurve.h"
 
 #include <algorithm>

@@ -14,8 +14,6 @@ struct LegLengths
 /// Stiffness of the target's knees, in millimeters per radian: they rotate by at most 0.8 degrees per
 /// millimeter.
 inline constexpr double kKneeStiffness = 75.0;
-/// Same for its elbows, which a viewer watches less.
-inline constexpr double kElbowStiffness = 45.0;
 
 /// Returns the distance between hip and ankle at a given bend.
 double ReachAt(const LegLengths& leg, double bend);
