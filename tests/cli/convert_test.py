@@ -91,7 +91,7 @@ class Convert(CliTest):
 
     def test_a_switch_changes_certain_bones_and_no_others(self):
         legs = {side + bone for side in "LR" for bone in ("Thigh", "Calf", "Foot")}
-        arms = {side + bone for side in "LR" for bone in ("UpperArm", "Forearm", "Hand")}
+        arms = {side + bone for side in "LR" for bone in ("Collar", "UpperArm", "Forearm", "Hand")}
         trunk = {"LowerTorso", "Waist", "UpperTorso", "Neck", "LCollar", "RCollar"}
         wave = ["--profile", "Max BVH", "--align", "--faithful"]
         rows = [  # switch, source, other options, bones
