@@ -17,8 +17,8 @@ namespace gw {
 namespace {
 
 // How much the knee's usual side counts, in millimeters. It decides for a straight leg; the knee of a bent
-// one is ten times farther from the line between hip and ankle.
-constexpr float kForwardHint = 10.0f;
+// one is many times farther from the line between hip and ankle.
+constexpr float kForwardHint = 3.0f;
 
 std::vector<LegJoints> TargetLegs(CNode* root)
 {
@@ -189,13 +189,20 @@ void CFaithfulPose::WriteHands(size_t frame, const std::vector<CKeyframeControl*
     m_kHands.WriteFrame(frame, tracks);
 }
 
-// Returns the position of the knee relative to the hip, in the plane of the source's leg.
+// Returns the position of the knee relative to the hip. The knee is off the line between hip and ankle where
+// the source's is. If it is bent more than the source's, it is farther off, in its usual direction: the
+// direction of a nearly straight leg turns quickly, and would swing a knee that is clearly bent.
 Vec3 CFaithfulPose::KneePlace(size_t k, size_t frame, const Vec3& ankle) const
 {
     const CFaithfulLeg& leg = m_kLegs[k];
+    const auto offAt = [&](double bend) { return std::sqrt(SquareSlopeAt(leg.Lengths(), bend)); };
+    const double more = offAt(BendAt(leg.Lengths(), Vec3Length(ankle))) - offAt(leg.KneeBend(frame));
     const Vec3 sourceKnee = leg.At(frame).thigh * static_cast<float>(leg.Lengths().upper);
-    const Vec3 forward = Vec3Normalized(leg.Forward(matcher_)) * kForwardHint;
-    return MiddleJoint(leg.Lengths(), ankle, sourceKnee + forward);
+    const Vec3 line = Vec3Normalized(leg.Stretch(frame));
+    const Vec3 sourceOff = sourceKnee - line * static_cast<float>(Vec3Dot(sourceKnee, line));
+    const Vec3 forward =
+        Vec3Normalized(leg.Forward(matcher_)) * (kForwardHint + static_cast<float>(std::max(more, 0.0)));
+    return MiddleJoint(leg.Lengths(), ankle, sourceOff + forward);
 }
 
 void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframeControl*>& tracks)

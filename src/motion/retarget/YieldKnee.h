@@ -19,7 +19,8 @@ inline constexpr double kKneeStiffness = 75.0;
 double ReachAt(const LegLengths& leg, double bend);
 /// Returns the bend at which hip and ankle are `reach` apart, or 0 if the straight leg is shorter than that.
 double BendAt(const LegLengths& leg, double reach);
-/// Returns the square of the reach's derivative with respect to the knee's angle, per radian squared.
+/// Returns the square of the reach's derivative with respect to the knee's angle, per radian squared. The
+/// derivative is also the distance of the knee from the line between hip and ankle.
 double SquareSlopeAt(const LegLengths& leg, double bend);
 /// Returns the bend of a leg that should reach `asked` but also keep its own bend. If the knee is bent, the
 /// result reaches `asked`. If it is straight, the result stays close to `bend`, because there a small change
