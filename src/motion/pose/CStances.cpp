@@ -9,6 +9,7 @@
 #include "Skeleton.h"
 
 #include <algorithm>
+#include <ranges>
 
 namespace gw {
 
@@ -49,17 +50,33 @@ private:
     Mat4 m_kWorld;
 };
 
+// Returns the ends of the bones that have no joint after them. Some programs write an end of a fixed length,
+// such as 1 in a file in meters: one that is much longer than every other bone is left out.
+std::vector<Vec3> TipsOf(const std::vector<CNode*>& joints)
+{
+    constexpr double kMostTip = 1.5; // longest bones
+    double longest = 0.0;
+    for (const CNode* joint : joints | std::views::drop(1))
+        longest = std::max<double>(longest, Vec3Length(RestLocal(*joint).Translation()));
+    std::vector<Vec3> tips;
+    for (const CNode* joint : joints)
+    {
+        const Vec3 tip = joint->HasNoNodeChild() ? NodeBoneEnd(*joint) : kVec3Zero;
+        tips.push_back(longest > 0.0 && Vec3Length(tip) > kMostTip * longest ? kVec3Zero : tip);
+    }
+    return tips;
+}
+
 } // namespace
 
 CStances::CStances(CNode& root) : m_kJoints(NodesOf(root)), m_kInFrames(m_kJoints.size())
 {
-    m_kLocalTips.reserve(m_kJoints.size());
+    m_kLocalTips = TipsOf(m_kJoints);
     m_kRest.reserve(m_kJoints.size());
     for (CNode* joint : m_kJoints)
     {
         const int parent = IndexOf(joint->GetParentNode());
         m_kIndex.emplace(joint, static_cast<int>(m_kRest.size()));
-        m_kLocalTips.push_back(joint->HasNoNodeChild() ? NodeBoneEnd(*joint) : kVec3Zero);
         m_kRest.push_back(parent < 0 ? RestLocal(*joint)
                                      : RestLocal(*joint) * m_kRest[static_cast<size_t>(parent)]);
     }

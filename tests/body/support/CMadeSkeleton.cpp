@@ -17,7 +17,7 @@ constexpr std::string_view kRecipes =
     "spine10 neck3, helpers fingers notoes, hipjoints zup, hipjoints notoes bare walk, "
     "twist fingers apose, twist hipjoints helpers fingers toes5, twistleaf fingers down, root, "
     "root prop torsofirst, sword, sword fingers down, tail, rightfirst zup metres, "
-    "torsofirst rightfirst fingers, zup turned, apose bare metres, down twist fingers, "
+    "torsofirst rightfirst fingers, zup turned, apose longends metres, down twist fingers, "
     "nopose walk rightfirst fingers, nopose walk zup helpers, nopose walk notoes, nopose, "
     "walk notoes bare twist, child fingers down, longarms noclavicle apose";
 
@@ -52,7 +52,10 @@ CMadeSkeleton::CMadeSkeleton(std::string_view recipe, unsigned seed)
         m_kFigure.Move(joint.node->GetName(), ToLocal(offset, parent.frame));
     }
     for (const Joint& joint : m_kJoints)
-        m_kFigure.AddMesh(joint.node->GetName(), ToLocal(Turned(joint.tip, m_kAxes), joint.frame));
+    {
+        const Vec3 tip = Has("longends") ? kVec3UnitX * 100.0f : joint.tip;
+        m_kFigure.AddMesh(joint.node->GetName(), ToLocal(Turned(tip, m_kAxes), joint.frame));
+    }
     m_kFigure.Record(
         Has("walk") ? 24 : 1, [this](CMadeFigure&, int frame) { Pose(frame); }, 0.04f);
     m_kMotion.motionRoot = &m_kFigure.Root();
