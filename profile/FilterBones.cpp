@@ -27,7 +27,7 @@ std::string BonePath(const CBoneTree& tree, int item)
     const auto& items = tree.Items();
     const auto parentOf = [&](int child) { return items[static_cast<size_t>(child)].m_iParent; };
     for (int bone = parentOf(item); bone != CBoneTree::kNone; bone = parentOf(bone))
-        path = tree.Text(bone) + (path.empty() ? "" : " / ") + path;
+        path.insert(0, path.empty() ? "" : " / ").insert(0, tree.Text(bone));
     return path;
 }
 

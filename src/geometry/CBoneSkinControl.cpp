@@ -80,7 +80,7 @@ void CBoneSkinControl::Link(COrrinStream& stream, CLinkRecord& record)
 
 uint64_t CBoneSkinControl::GetMemoryUsed() const
 {
-    constexpr size_t kInfluenceBytes = sizeof(CSpatial*) + sizeof(float) + sizeof(uint32_t);
+    constexpr size_t kInfluenceBytes = sizeof(void*) + sizeof(float) + sizeof(uint32_t);
     uint64_t bytes = CControl::GetMemoryUsed() + 36 + m_kPoints.size() * sizeof(CSkinPointRecord) +
                      m_kPointBones.size() * kInfluenceBytes;
     for (const auto& row : m_kGroups)

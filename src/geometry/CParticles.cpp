@@ -49,7 +49,7 @@ bool CParticles::Update(float time)
 {
     m_bNormalsValid = false;
     m_bWorldValid = false;
-    CSpatial::Update(time);
+    CSpatial::Update(time); // NOLINT(bugprone-parent-virtual-call): CGeometry would transform the points
     m_bNormalsValid = true;
     m_bWorldValid = true;
     return true;
@@ -57,7 +57,7 @@ bool CParticles::Update(float time)
 
 bool CParticles::UpdateRange(uint32_t range, float time)
 {
-    CSpatial::UpdateRange(range, time);
+    CSpatial::UpdateRange(range, time); // NOLINT(bugprone-parent-virtual-call): as in Update
     m_bNormalsValid = true;
     m_bWorldValid = true;
     return true;

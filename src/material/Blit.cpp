@@ -98,7 +98,7 @@ bool Blit(CPixelBuffer& destination, int32_t x, int32_t y, const CPixelBuffer& s
         return false;
     if (&destination == &source)
     {
-        // Rows can overlap, so draw from a copy.
+        // NOLINTNEXTLINE(performance-unnecessary-copy-initialization): rows can overlap, so draw from a copy
         const CPixelBuffer before(source);
         return Blit(destination, x, y, before, sourceX, sourceY, width, height, opacity);
     }

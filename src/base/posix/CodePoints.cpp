@@ -11,6 +11,7 @@ std::optional<std::u32string> CodePoints(std::string_view text, EEncoding encodi
     constexpr size_t kPointsPerByte = 2; // at most, in Big5: a letter with its accent
     constexpr char32_t kLastPoint = 0x10ffff;
     const iconv_t converter = iconv_open("UCS-4LE", encoding == EEncoding::UTF8 ? "UTF-8" : "BIG5-HKSCS");
+    // NOLINTNEXTLINE(performance-no-int-to-ptr): that is how the interface reports a failure
     if (converter == reinterpret_cast<iconv_t>(-1))
         return std::nullopt;
     std::u32string points(kPointsPerByte * text.size(), U'\0');

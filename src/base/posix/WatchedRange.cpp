@@ -32,6 +32,7 @@ bool PatchAt(uintptr_t address)
         // Everything after this page is missing too, so one signal is enough.
         const uintptr_t page = address / g_uiPageSize * g_uiPageSize;
         range.cut = true;
+        // NOLINTNEXTLINE(performance-no-int-to-ptr): the address was rounded to that of its page
         return mmap(reinterpret_cast<void*>(page), end - page, PROT_READ,
                     MAP_PRIVATE | MAP_ANONYMOUS | MAP_FIXED | MAP_NORESERVE, -1, 0) != MAP_FAILED;
     }

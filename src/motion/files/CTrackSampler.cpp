@@ -36,6 +36,7 @@ bool CTrackSampler::MoveTo(float time)
     const KeySpan span = FindKeys(track_.MapTime(time), track_.m_kKeyTimes, m_uiCursor);
     const Pose pose{RotationAt(span), LinearKey(track_.m_kPositionKeys, span, kVec3Zero),
                     LinearKey(track_.m_kScaleKeys, span, kVec3One)};
+    // NOLINTNEXTLINE(bugprone-suspicious-memory-comparison): as keys are compared, without gaps
     if (m_bHasPose && std::memcmp(&pose, &m_kPose, sizeof(Pose)) == 0)
         return false;
     m_kPose = pose;
