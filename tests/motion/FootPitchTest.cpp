@@ -1,11 +1,14 @@
 #include "FootPitch.h"
 
 #include "Directions.h"
+#include "SettleFoot.h"
 
 #include <gtest/gtest.h>
 
+#include <algorithm>
 #include <cmath>
 #include <limits>
+#include <vector>
 
 namespace gw {
 namespace {
@@ -44,6 +47,19 @@ TEST(FootPitch, LowersTheToeAndKeepsHeadingAndLength)
     EXPECT_NEAR(lowered.x / lowered.z, toe.x / toe.z, 1e-4f);
     EXPECT_NEAR(Vec3Length(lowered), Vec3Length(toe), 1e-3f);
     EXPECT_EQ(LoweredToe({0.0f, -100.0f, 0.0f}, 5.0), kMat3Identity) << "an upright foot";
+}
+
+// A foot whose heel is 60 mm too high, then one that is off by 5 mm, and a swinging one between them.
+TEST(SettleFoot, TakesDownAHeelThatIsClearlyTooHigh)
+{
+    std::vector<ToeWish> wishes(300, {Pitched(-60.0, 144.0), 64.7, 1.0});
+    std::fill(wishes.begin() + 100, wishes.begin() + 200, ToeWish{Pitched(-60.0, 144.0), 64.7, 0.0});
+    std::fill(wishes.begin() + 200, wishes.end(), ToeWish{Pitched(-60.0, 144.0), 119.7, 1.0});
+    const std::vector<double> drops = SettleFoot(wishes, 1.0 / 60.0);
+    EXPECT_LT(drops[50], -40.0);
+    EXPECT_GT(drops[50], -60.0) << "softly limited";
+    EXPECT_NEAR(drops[150], 0.0, 1.0);
+    EXPECT_NEAR(drops[250], 0.0, 0.5);
 }
 
 } // namespace

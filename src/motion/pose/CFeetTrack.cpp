@@ -4,6 +4,7 @@
 #include "Figures.h"
 
 #include <algorithm>
+#include <cmath>
 #include <iterator>
 
 namespace gw {
@@ -14,6 +15,8 @@ namespace {
 // from the second on, it hovers.
 constexpr double kLowHeight = 0.02;
 constexpr double kHoverHeight = 0.05;
+// In leg lengths per second: at this speed, a foot is half settled.
+constexpr double kSettledSpeed = 0.3;
 
 } // namespace
 
@@ -109,6 +112,12 @@ FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float 
         const double hovers = isFlat ? 0.0 : Smoothstep((height - kLowHeight) / (kHoverHeight - kLowHeight));
         std::fill(touches.landed.begin() + contact.first, touches.landed.begin() + contact.end,
                   static_cast<float>(1.0 - hovers));
+    }
+    for (size_t frame = 0; frame < motion.size(); ++frame)
+    {
+        const double speed = motion[frame].speed / (kSettledSpeed * m_fLegLength);
+        touches.settled.push_back(touches.landed[frame] / static_cast<float>(1.0 + std::pow(speed, 4.0)));
+        touches.ankleHeights.push_back(static_cast<float>(ankleMotion[frame].height / m_fLegLength));
     }
     return touches;
 }

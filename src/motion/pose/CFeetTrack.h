@@ -24,6 +24,10 @@ struct FootTouches
     std::vector<float> aloft;
     /// Height of the higher of ankle and toe above its floor in leg lengths; one value per frame.
     std::vector<float> heights;
+    /// Height of the ankle above its floor in leg lengths; one value per frame.
+    std::vector<float> ankleHeights;
+    /// Confidence, 0 to 1, that the foot has landed and hardly moves; one value per frame.
+    std::vector<float> settled;
     /// Frames in which the ankle stands, whatever the toe does.
     std::vector<Contact> ankle;
     /// Same for the toe; empty for a foot without one.

@@ -53,6 +53,8 @@ public:
     const LegLengths& Lengths() const { return m_kLengths; }
     /// Returns the height of the ankle of a foot that stands flat.
     float AnkleHeight() const { return static_cast<float>(Vec3Length(m_kHeelSole)); }
+    /// Returns how far the toe of a foot that stands flat is below its ankle.
+    double FlatDrop() const { return -m_kFlatToe.height; }
     /// Returns how far the sole's toe end is below the target's ankle; 0 without a toe.
     float ToeSole(size_t frame) const;
     /// Returns the vector from hip to ankle if thigh and calf point in the source's directions.

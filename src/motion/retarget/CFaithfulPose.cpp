@@ -5,6 +5,7 @@
 #include "HostBones.h"
 #include "JointSteps.h"
 #include "PointBone.h"
+#include "SettleFoot.h"
 #include "Skeleton.h"
 #include "YieldFoot.h"
 
@@ -118,6 +119,31 @@ ToePlace CFaithfulPose::ToeMoved(size_t leg, size_t frame, double flatDrop) cons
     return {(place.ahead - std::sqrt(std::max(square, 0.0))) * scale, (place.height + flatDrop) * scale};
 }
 
+// Pitches a foot that stands so that its ankle is as high above the floor as the source's. If the source's
+// toe sinks into the floor, only the ankle counts.
+void CFaithfulPose::SettleFeet(double secondsPerFrame, double flatDrop)
+{
+    for (size_t leg = 0; leg < m_kLegs.size(); ++leg)
+    {
+        CFaithfulLeg& of = m_kLegs[leg];
+        if (!of.HasToe())
+            continue;
+        const double length = of.Lengths().upper + of.Lengths().lower;
+        const FootTouches& touch = m_kSource.Touches()[leg];
+        std::vector<ToeWish> wishes;
+        for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
+        {
+            const double heel = -ToeMoved(leg, frame, flatDrop).height;
+            const double ankle = std::max(static_cast<double>(touch.ankleHeights[frame]) * length, 0.0);
+            wishes.push_back({of.At(frame).toe, of.FlatDrop() + (heel < ankle ? heel : ankle),
+                              static_cast<double>(touch.settled[frame])});
+        }
+        const std::vector<double> drops = SettleFoot(wishes, secondsPerFrame);
+        for (size_t frame = 0; frame < drops.size(); ++frame)
+            of.TurnFoot(frame, LoweredToe(of.At(frame).toe, drops[frame]));
+    }
+}
+
 // Rotates a foot that has a toe by the few degrees that keep it from sliding.
 void CFaithfulPose::YieldFeet(double secondsPerFrame, double flatDrop)
 {
@@ -164,7 +190,10 @@ void CFaithfulPose::Plan(const std::vector<CKeyframeControl*>& tracks, const Vec
             m_kLegs[leg].ReadTarget(matcher_, frame, ToeMoved(leg, frame, flatDrop));
     }
     if (holdFeet)
+    {
         YieldFeet(secondsPerFrame, flatDrop);
+        SettleFeet(secondsPerFrame, flatDrop);
+    }
     plan_.emplace(m_kLegs, m_kSource, m_kHands.LowestHand(), origin, secondsPerFrame, holdFeet);
 }
 

@@ -51,6 +51,7 @@ public:
 private:
     void PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
     ToePlace ToeMoved(size_t leg, size_t frame, double flatDrop) const;
+    void SettleFeet(double secondsPerFrame, double flatDrop);
     void YieldFeet(double secondsPerFrame, double flatDrop);
     Vec3 KneePlace(size_t leg, size_t frame, const Vec3& ankle) const;
     void WriteLeg(size_t leg, size_t frame, const std::vector<CKeyframeControl*>& tracks);
