@@ -21,7 +21,7 @@ namespace {
 
 constexpr double kMostSettle = 0.5;  // radians, softly; a source that needs more has no usual foot
 constexpr double kNoticed = 35.0;    // millimeters by which a heel is clearly too high or too low
-constexpr double kSettleHertz = 3.0; // of the changes
+constexpr double kSettleHertz = 2.0; // of the changes
 constexpr double kSwingWeight = 0.1; // weight of the source's rotation; the height of a still foot has 1
 
 } // namespace
