@@ -211,6 +211,7 @@ TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
         wishes[frame].free = -40.0f;
     for (size_t frame = 170; frame < 210; ++frame)
         wishes[frame].landed = 1.0f;
+    wishes[200].free = 90.0f;
     for (size_t frame = 250; frame < 290; ++frame)
         wishes[frame] = {30.0f, 0.0f, 1.0f, 45.0f};
     for (size_t frame = 290; frame < 330; ++frame)
@@ -219,6 +220,7 @@ TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
     EXPECT_NEAR(heights[10], 30.0, 1.0) << "on its free path";
     EXPECT_NEAR(heights[90], -40.0 / 16.0, 1.0) << "a sixteenth of a dip stays";
     EXPECT_NEAR(heights[190], 30.0 / 7.0, 1.5) << "nearly on the floor";
+    EXPECT_NEAR(heights[197], 30.0 / 7.0, 5.0) << "not dragged by a glitch";
     EXPECT_NEAR(heights[270], 30.0 + 15.0 * 4.0 / 5.0, 1.5) << "nearly as high as it should be aloft";
     EXPECT_NEAR(heights[320], 60.0, 1.5) << "high enough already";
 }

@@ -1,8 +1,9 @@
 // Heights are found by least squares over all frames: the sole on the floor once it has landed, elsewhere
 // close to its free path, without sudden changes. A little is left of the free height of a sole that has
 // landed, so that steps on a floor that is not quite level do not shake the leg. But a sole that would
-// visibly hover or sink is weighted more in a second round, which corrects it. A foot that is still in the
-// air, or on a step, is kept from coming so low that it seems to stand.
+// visibly hover or sink is weighted more in a second round, which corrects it. A sole that hovers for a frame
+// or two is a glitch of the recording, and must not drag the whole stance below the floor. A foot that is
+// still in the air, or on a step, is kept from coming so low that it seems to stand.
 
 #include "LandFoot.h"
 
@@ -24,13 +25,23 @@ constexpr double kLandHertz = 1.4;    // of the changes between the two
 constexpr double kHover = 12.0;       // millimeters from the floor at which a landed sole is weighted double
 constexpr double kSunk = 6.0;         // millimeters below the floor at which a dip is weighted double
 constexpr double kMostSunk = 3.0;     // what sinking adds to the weight of a dip, at most
+constexpr double kGlitchSeconds = 1.0 / 30.0;
 constexpr int kLandRounds = 2;
+
+// Returns the median of the values at a frame, before it and after it.
+double SteadyAt(const std::vector<double>& values, size_t frame, size_t apart)
+{
+    const double before = values[frame - std::min(frame, apart)];
+    const double after = values[std::min(frame + apart, values.size() - 1)];
+    return std::max(std::min(before, after), std::min(std::max(before, after), values[frame]));
+}
 
 } // namespace
 
 std::vector<double> LandFoot(std::span<const SoleWish> wishes, double secondsPerFrame)
 {
     std::vector<double> heights(wishes.size(), 0.0);
+    const auto apart = static_cast<size_t>(std::clamp(kGlitchSeconds / secondsPerFrame, 1.0, 1000.0));
     for (int round = 0; round < kLandRounds; ++round)
     {
         CBandFit rise(wishes.size(), BendWeight(kLandHertz, secondsPerFrame), 1.0);
@@ -39,7 +50,7 @@ std::vector<double> LandFoot(std::span<const SoleWish> wishes, double secondsPer
             const SoleWish& wish = wishes[frame];
             const auto sole = static_cast<double>(wish.free);
             const auto share = static_cast<double>(wish.landed);
-            const double hovers = std::pow(share * heights[frame] / kHover, 4.0);
+            const double hovers = std::pow(share * SteadyAt(heights, frame, apart) / kHover, 4.0);
             rise.AddValue(frame, share > 0.0 ? kLandedWeight * (1.0 + hovers) : 0.0, -share * sole);
             rise.AddValue(frame, kAloftWeight * static_cast<double>(wish.aloft),
                           static_cast<double>(std::max(wish.least - wish.free, 0.0f)));
