@@ -96,7 +96,7 @@ void WatchBody(const CBodyMap& body, CPoseSampler& sampler)
 } // namespace
 
 CMotionEvidence::CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn,
-                                 std::span<const LooseWay> ways)
+                                 std::span<const LooseWay> ways, bool seeksFrame)
 {
     for (const LooseWay& way : ways)
         m_kWays.push_back({way, kVec3Zero});
@@ -108,10 +108,10 @@ CMotionEvidence::CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn
         *hinge++ = {arm.upperArm, arm.forearm, arm.hand, {}, {}};
         *hinge++ = {leg.thigh, leg.shin, leg.foot, {}, {}};
     }
-    Walk(motion, worldTurn);
+    Walk(motion, worldTurn, seeksFrame);
 }
 
-void CMotionEvidence::Walk(const BodyMotion& motion, const Mat3& worldTurn)
+void CMotionEvidence::Walk(const BodyMotion& motion, const Mat3& worldTurn, bool seeksFrame)
 {
     CPoseSampler sampler(motion.frequency);
     WatchBody(motion.body, sampler);
@@ -126,14 +126,16 @@ void CMotionEvidence::Walk(const BodyMotion& motion, const Mat3& worldTurn)
         sampler.Pose(frame);
         leg = frame == 0 ? LegLength(motion.body) : leg;
         soles.Add();
-        JudgeFrame(motion.body, up, frame);
+        AddFrame();
+        if (seeksFrame)
+            JudgeFrame(motion.body, up, frame);
     }
     for (const EBodySide side : kBodySides)
         m_kSoles[static_cast<size_t>(side)] =
             soles.Normal(side, leg, static_cast<double>(motion.frequency) * step);
 }
 
-void CMotionEvidence::JudgeFrame(const CBodyMap& body, const Vec3& up, int frame)
+void CMotionEvidence::AddFrame()
 {
     for (Hinge& hinge : m_kHinges)
     {
@@ -146,6 +148,10 @@ void CMotionEvidence::JudgeFrame(const CBodyMap& body, const Vec3& up, int frame
     }
     for (auto& [joints, sum] : m_kWays)
         sum = sum + LocalDirection(Vec3Normalized(WayTo(joints.from, joints.to)), *joints.from);
+}
+
+void CMotionEvidence::JudgeFrame(const CBodyMap& body, const Vec3& up, int frame)
+{
     const double error = StanceError(body, up);
     if (m_iReferenceFrame >= 0 && !(error < m_fReferenceError))
         return;

@@ -26,8 +26,9 @@ class CMotionEvidence
 {
 public:
     /// Examines the motion at thirty frames per second, or all frames if there are fewer. `worldTurn` rotates
-    /// it so that Y is up.
-    CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn, std::span<const LooseWay> ways);
+    /// it so that Y is up. Without `seeksFrame`, no reference frame is looked for.
+    CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn, std::span<const LooseWay> ways,
+                    bool seeksFrame);
 
     /// Returns the axis of a knee or an elbow in the space of one of its bones: cross(upper way, lower way).
     std::optional<Vec3> HingeAxis(const CNode& bone) const;
@@ -38,7 +39,7 @@ public:
     }
     /// Returns the mean direction of a loose way in the space of its joint; nothing for other joints.
     std::optional<Vec3> MeanWay(const CNode& from) const;
-    /// Returns the frame closest to a reference pose; -1 in a motion without frames.
+    /// Returns the frame closest to a reference pose; -1 if none was looked for or there are no frames.
     int ReferenceFrame() const { return m_iReferenceFrame; }
 
 private:
@@ -57,7 +58,8 @@ private:
         Vec3 sum; // of unit vectors in the space of the lower joint
     };
 
-    void Walk(const BodyMotion& motion, const Mat3& worldTurn);
+    void Walk(const BodyMotion& motion, const Mat3& worldTurn, bool seeksFrame);
+    void AddFrame();
     void JudgeFrame(const CBodyMap& body, const Vec3& up, int frame);
 
     std::array<Hinge, 4> m_kHinges;

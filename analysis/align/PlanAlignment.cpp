@@ -192,7 +192,7 @@ bool CAlignmentPlanner::Plan()
     FindUp();
     m_kDoubled = FindDoubled(m_kTree, motion_);
     AddDoubled(m_kTree.Joints(), m_kDoubled, alignment_.corrections);
-    const CMotionEvidence evidence(motion_, alignment_.worldTurn, m_kWays);
+    const CMotionEvidence evidence(motion_, alignment_.worldTurn, m_kWays, !m_bIsRest);
     PoseReference(evidence);
     const CReferencePose pose(motion_.body, m_kUp);
     const std::vector<Mat3> turns =
