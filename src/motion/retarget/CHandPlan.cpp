@@ -127,7 +127,8 @@ double WeightOf(double distance, double thickness)
 // Returns the right distance that is nearest to a given one.
 double RightDistance(double distance, double source, double thickness)
 {
-    const double slack = kRightGap + kRightShare * std::max(source - thickness, 0.0);
+    const double gap = std::max(source - thickness, 0.0);
+    const double slack = kRightGap + kRightShare * gap + 1.0 * std::max(gap - kTouch, 0.0);
     return std::clamp(distance, std::max(source - slack, 0.0), source + slack);
 }
 
