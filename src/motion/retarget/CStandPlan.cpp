@@ -133,10 +133,11 @@ void CStandPlan::StandOnFloor(const std::vector<FootTouches>& touches, float low
         for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
             all.push_back(-FreeSole(leg, frame));
     }
-    float lift = standing.empty() ? Percentile(std::move(all), 1.0 - kFloorShare)
-                                  : Percentile(std::move(standing), 0.5);
+    const bool stands = !standing.empty();
+    float lift = stands ? Percentile(std::move(standing), 0.5)
+                        : Percentile(std::move(all), 1.0 - kFloorShare);
     const float hands = kWristHeight - (lowestHand - source_.Hips(0).y) * static_cast<float>(m_fScale);
-    if (standing.empty() && std::isfinite(hands) && hands > lift)
+    if (!stands && std::isfinite(hands) && hands > lift)
     {
         lift = hands;
         m_bHasFloor = true;
@@ -145,7 +146,7 @@ void CStandPlan::StandOnFloor(const std::vector<FootTouches>& touches, float low
         root.y += lift;
     m_fRaised = lift - source_.Hips(0).y * static_cast<float>(m_fScale);
     const float floor = source_.Floor(kLeastToe / m_fScale);
-    if (!standing.empty() && std::isfinite(floor))
+    if (stands && std::isfinite(floor))
         m_fRaised = -floor * static_cast<float>(m_fScale);
 }
 
