@@ -1,8 +1,11 @@
 // What a faithful conversion promises, of a source whose feet, knees and hips are known.
 
 #include "Angles.h"
+#include "CFaithfulLeg.h"
 #include "CKeyframeControl.h"
 #include "CLegTrack.h"
+#include "CSourceBody.h"
+#include "CStandPlan.h"
 #include "CWalker.h"
 #include "Directions.h"
 #include "Rotations.h"
@@ -252,6 +255,37 @@ TEST_F(Faithful, FeetOfASinglePoseStandOnTheFloor)
     PoseAt(0);
     EXPECT_NEAR(Place("LFoot").y, 80.0f, 1.0f);
     EXPECT_NEAR(Place("RFoot").y, 80.0f + 22.0f * kScale, 12.0f);
+}
+
+// Feet stand still, and a hand hangs far below them, as over the edge of a stage.
+TEST_F(Faithful, StandingBodyIsNotLiftedByAHandBelowItsFeet)
+{
+    m_kWalker.Record(20, [](int) { return CWalker::Pose(); });
+    CPoseMatcher matcher(m_kRetargeter, *m_kTarget);
+    std::vector<CFaithfulLeg> legs;
+    for (const std::string side : kSides)
+        legs.push_back(*CFaithfulLeg::Plan(
+            m_kRetargeter, matcher,
+            {&Target(side + "Thigh"), &Target(side + "Calf"), &Target(side + "Foot"), &Target(side + "Toe")},
+            0.0));
+    CSourceBody source(&m_kWalker.Root(), {legs[0].Source(), legs[1].Source()});
+    for (int frame = 0; frame < 20; ++frame)
+    {
+        PoseAt(frame);
+        matcher.MatchPose();
+        source.Append();
+        for (CFaithfulLeg& leg : legs)
+        {
+            leg.AppendSource();
+            leg.ReadTarget(matcher, static_cast<size_t>(frame), {});
+        }
+    }
+    source.FindTouches(kWalkerSeconds);
+    const auto plan = [&](float lowestHand) {
+        return CStandPlan(legs, source, lowestHand, kTargetOrigin, kWalkerSeconds, false);
+    };
+    EXPECT_EQ(plan(-60.0f).Root(10), plan(80.0f).Root(10));
+    EXPECT_NEAR(plan(-60.0f).OnTarget({}).y, 0.0f, 12.0f) << "and its own floor stays the floor";
 }
 
 // The lower joint of a foot is 4 below the origin at rest, half a calf is 18.5 long.
