@@ -16,7 +16,7 @@ namespace gw {
 
 namespace {
 
-constexpr double kLeastTurn = 1e-4; // in radians; smaller turns are skipped
+constexpr double kLeastTurn = 3e-4; // in radians; smaller turns are skipped
 
 constexpr float kNaN = std::numeric_limits<float>::quiet_NaN();
 constexpr Vec3 kNowhere{kNaN, kNaN, kNaN}; // of a joint that is missing: nothing touches it
@@ -128,11 +128,12 @@ TouchPoints CFaithfulHands::SourceAt(size_t frame, const std::function<Vec3(cons
     return PointsOf(places);
 }
 
-// Poses the target with the root at its real height but at x = z = 0. Far from the origin, a float position
-// is too coarse for a small gap.
-void CFaithfulHands::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
+// Poses bones of the target, parents first, with the root at its real height but at x = z = 0. Far from the
+// origin, a float position is too coarse for a small gap.
+void CFaithfulHands::Pose(const std::vector<size_t>& bones, size_t frame,
+                          const std::vector<CKeyframeControl*>& tracks)
 {
-    for (const size_t index : m_kBones)
+    for (const size_t index : bones)
     {
         CPoseMatcher::Bone& bone = matcher_.Bones()[index];
         bone.rotation = QuatToMat3(tracks[index]->m_kRotationKeys[frame]);
@@ -172,7 +173,7 @@ void CFaithfulHands::Plan(const std::vector<CKeyframeControl*>& tracks,
         const TouchPoints source = SourceAt(frame, onTarget);
         if (!plan.Touches(source))
             continue;
-        PoseFrame(frame, tracks);
+        Pose(m_kBones, frame, tracks);
         for (CFaithfulArm& arm : m_kArms)
             arm.ReadPose(matcher_);
         plan.Add(sample, source, TargetPoints());
@@ -188,14 +189,13 @@ void CFaithfulHands::WriteFrame(size_t frame, const std::vector<CKeyframeControl
 {
     if (!plan_)
         return;
-    const ArmTurn turns[] = {plan_->Turn(0, frame), plan_->Turn(1, frame)};
-    if (std::max(SizeOf(turns[0]), SizeOf(turns[1])) < kLeastTurn)
-        return;
-    PoseFrame(frame, tracks);
     for (size_t side = 0; side < m_kArms.size(); ++side)
     {
-        if (SizeOf(turns[side]) >= kLeastTurn)
-            m_kArms[side].Turn(matcher_, turns[side], frame, tracks);
+        const ArmTurn turn = plan_->Turn(side, frame);
+        if (SizeOf(turn) < kLeastTurn)
+            continue;
+        Pose(m_kArms[side].Path(), frame, tracks);
+        m_kArms[side].Turn(matcher_, turn, frame, tracks);
     }
 }
 

@@ -37,7 +37,7 @@ public:
 private:
     void PlanBones(const std::vector<CFaithfulLeg>& legs, const CNode* neck, const CNode* head);
     TouchPoints SourceAt(size_t frame, const std::function<Vec3(const Vec3&)>& onTarget) const;
-    void PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks);
+    void Pose(const std::vector<size_t>& bones, size_t frame, const std::vector<CKeyframeControl*>& tracks);
     ArmPoints TargetPoints() const;
 
     static constexpr size_t kJoints = 8;
