@@ -86,7 +86,10 @@ CStances::CStances(CNode& root) : m_kJoints(NodesOf(root)), m_kInFrames(m_kJoint
     const size_t frames = track->m_kKeyTimes.size();
     const size_t count = std::clamp<size_t>(kMostPlaces / m_kJoints.size(), 1, std::min(frames, kMostFrames));
     for (size_t i = 0; i < count; ++i)
-        m_kTimes.push_back(TimeOfPose(static_cast<double>(i * frames / count), track->m_fFrequency));
+    {
+        const size_t frame = i * frames / count;
+        m_kTimes.push_back(TimeOfPose(static_cast<double>(frame), track->m_fFrequency));
+    }
 }
 
 int CStances::IndexOf(const CNode* joint) const
@@ -113,16 +116,16 @@ const Mat4& CStances::World(size_t stance, int joint) const
 void CStances::PoseInFrames(CNode& node) const
 {
     const auto joint = static_cast<size_t>(IndexOf(&node));
-    CNode* const parent = node.GetParentNode();
-    const int above = IndexOf(parent);
+    const int above = IndexOf(node.GetParentNode());
+    CNode* const parent = above < 0 ? nullptr : node.GetParentNode();
     const CPoseKeeper keeper(node);
-    const CPoseKeeper parentKeeper(above < 0 ? node : *parent);
+    const CPoseKeeper parentKeeper(parent ? *parent : node);
     node.m_kWorldMatrix = m_kRest[joint]; // two controls of one joint leave it as it is
     std::vector<Mat4> worlds;
     worlds.reserve(m_kTimes.size());
     for (size_t frame = 0; frame < m_kTimes.size(); ++frame)
     {
-        if (above >= 0)
+        if (parent)
             parent->m_kWorldMatrix = m_kInFrames[static_cast<size_t>(above)][frame];
         node.CSpatial::UpdateTransform(m_kTimes[frame]);
         worlds.push_back(node.m_kWorldMatrix);

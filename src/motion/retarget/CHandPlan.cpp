@@ -128,7 +128,7 @@ double WeightOf(double distance, double thickness)
 double RightDistance(double distance, double source, double thickness)
 {
     const double gap = std::max(source - thickness, 0.0);
-    const double slack = kRightGap + kRightShare * gap + 1.0 * std::max(gap - kTouch, 0.0);
+    const double slack = kRightGap + kRightShare * gap + std::max(gap - kTouch, 0.0);
     return std::clamp(distance, std::max(source - slack, 0.0), source + slack);
 }
 
