@@ -48,7 +48,7 @@ constexpr float kHeadMiddle = 107.0f; // from the head's joint, in the direction
 constexpr double kOnFloor = 20.0;     // the goal of a wrist is never lower
 constexpr double kLowHand = 300.0;    // if the source's hand is higher, the target's is not below the floor
 
-// A gap is right if it is wrong by this at most, plus this share of it.
+// A gap is right if it is wrong by this at most, plus this share of it, plus all that it exceeds kTouch.
 constexpr double kRightGap = 4.0;
 constexpr double kRightShare = 0.2;
 
