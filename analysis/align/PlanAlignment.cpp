@@ -92,6 +92,17 @@ void AddMovedLimbs(const CTreePoser& tree, const std::vector<JointRole>& roles, 
     }
 }
 
+// Returns a joint's offset at rest. In a file that has all offsets in the motion, it is that of the first
+// frame.
+Vec3 OffsetOf(const CNode& joint, ELimbWays limbs)
+{
+    const Vec3 rest = RestLocal(joint).Translation();
+    const CKeyframeControl* const track = TrackOf(joint);
+    const bool isInMotion = limbs == ELimbWays::Mean && rest == kVec3Zero && joint.GetParentNode() && track &&
+                            !track->m_kPositionKeys.empty();
+    return isInMotion ? track->m_kPositionKeys.front() : rest;
+}
+
 bool IsFinite(const std::vector<Mat3>& turns)
 {
     for (const Mat3& turn : turns)
@@ -179,7 +190,7 @@ void CAlignmentPlanner::FillJoints(const std::vector<Mat3>& turns, const CRefere
     for (size_t i = 0; i < turns.size(); ++i)
     {
         CNode* const joint = m_kTree.Joints()[i];
-        alignment_.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], RestLocal(*joint).Translation(),
+        alignment_.joints.push_back({joint, m_kTree.ParentOf(i), turns[i], OffsetOf(*joint, motion_.limbs),
                                      AxisOf(m_kRoles[i]), m_kDoubled[i],
                                      m_kRoles[i].part != EBodyPart::None});
     }

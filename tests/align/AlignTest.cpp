@@ -302,6 +302,31 @@ TEST(UpAxis, IsThatOfABodyThatWalksFarFromTheOrigin)
     EXPECT_EQ(FindUpAxis(told.Motion().body, told.Motion().frequency, 40), -kVec3UnitZ);
 }
 
+TEST(PlanAlignment, FindsOffsetsThatAreOnlyInTheMotionIfBonesAreAimed)
+{
+    const CMadeBody told{Telling()};
+    for (const std::string& name : told.Names())
+    {
+        if (name == told.Names().front())
+            continue;
+        CKeyframeControl& track = told.Track(name);
+        track.m_kPositionKeys.assign(1, track.m_kRestMatrix.Translation());
+        track.m_kRestMatrix.SetTranslation(kVec3Zero);
+    }
+    BodyMotion motion = told.Motion();
+    for (const auto& [limbs, length] :
+         {std::tuple{ELimbWays::Offsets, 0.0f}, std::tuple{ELimbWays::Mean, 40.0f}})
+    {
+        motion.limbs = limbs;
+        Alignment alignment;
+        ASSERT_TRUE(PlanAlignment(motion, alignment));
+        const AlignedMotion aligned = AlignMotion(motion, alignment);
+        EXPECT_LT(LargestDistance(*motion.root, *aligned.root, motion, 20), 0.001);
+        const Vec3 calf = RestLocal(*FindNode(aligned.root.Get(), "LCalf")).Translation();
+        EXPECT_LT(Vec3Length(calf - Vec3{0.0f, -length, 0.0f}), 0.5f);
+    }
+}
+
 TEST(PlanAlignment, RefusesWhatIsNoBody)
 {
     const CMadeBody told{Telling()};
