@@ -242,6 +242,28 @@ TEST(SmoothCurve, KeepsPlaceAndSumOfAPeakAndTheEndsOfALine)
     EXPECT_NEAR(level.back(), 3.0f, 1e-5f);
 }
 
+// A knee that is nearly straight for ten frames, in which its direction turns over: it turns clearly
+// slower, and a bent knee is left where it is.
+TEST(SmoothCurve, SteadySidesSlowDownTheTurnOfANearlyStraightKnee)
+{
+    std::vector<Vec3> sides;
+    for (int frame = 0; frame < 60; ++frame)
+        sides.push_back({std::clamp(static_cast<float>(frame - 30), -5.0f, 5.0f) * 4.0f, 0.0f, 5.0f});
+    sides.push_back({0.0f, 360.0f, 0.0f});
+    sides.push_back({std::numeric_limits<float>::quiet_NaN(), 0.0f, 0.0f});
+    const auto fastest = [](const std::vector<Vec3>& of) {
+        double turn = 0.0;
+        for (size_t frame = 20; frame < 40; ++frame)
+            turn = std::max(turn, AngleBetween(of[frame], of[frame + 1]));
+        return turn;
+    };
+    const double before = fastest(sides);
+    SteadySides(sides, 360.0, 8.0);
+    EXPECT_LT(fastest(sides), 0.7 * before);
+    EXPECT_EQ(sides[60], (Vec3{0.0f, 360.0f, 0.0f}));
+    EXPECT_TRUE(std::isfinite(Vec3Length(sides[0])));
+}
+
 constexpr LegLengths kLegLengths{360.0, 345.0};
 constexpr double kStiffness = 40.0;
 

@@ -3,6 +3,7 @@
 #include "CPoseSampler.h"
 #include "Directions.h"
 #include "JointSteps.h"
+#include "SmoothCurve.h"
 
 #include <algorithm>
 #include <cmath>
@@ -15,6 +16,8 @@ namespace {
 // toes that do not bend by 1. How a source bends them is not followed, because some bend them within one
 // frame.
 constexpr double kToeTurn = 0.35;
+
+constexpr double kKneeSeconds = 0.04; // over which the direction of a straight leg's knee is smoothed
 
 size_t IndexOf(const CPoseMatcher& matcher, const CNode* node)
 {
@@ -97,6 +100,9 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
     Frame& at = m_kFrames[frame];
     const Mat4& thigh = bones[m_uiThigh].world;
     at.hip = thigh.Translation() - bones[m_kPath.front()].world.Translation();
+    const Vec3 line = Vec3Normalized(Stretch(frame));
+    const Vec3 knee = at.thigh * static_cast<float>(m_kLengths.upper);
+    at.knee = knee - line * static_cast<float>(Vec3Dot(knee, line));
     at.pitch = kMat3Identity;
     at.heelEnd = TransformCoord(m_kHeelSole, ankle) - ankle.Translation();
     Mat3 pitch = kMat3Identity;
@@ -107,6 +113,16 @@ void CFaithfulLeg::ReadTarget(const CPoseMatcher& matcher, size_t frame, const T
     }
     TurnFoot(frame, pitch);
     m_kForward = m_kForward + ToLocal(at.thigh - at.shin, NormalizedRows(thigh));
+}
+
+void CFaithfulLeg::SteadyKnee(double secondsPerFrame)
+{
+    std::vector<Vec3> knees;
+    for (const Frame& at : m_kFrames)
+        knees.push_back(at.knee);
+    SteadySides(knees, m_kLengths.upper, kKneeSeconds / secondsPerFrame);
+    for (size_t frame = 0; frame < knees.size(); ++frame)
+        m_kFrames[frame].knee = knees[frame];
 }
 
 void CFaithfulLeg::TurnFoot(size_t frame, const Mat3& turn)

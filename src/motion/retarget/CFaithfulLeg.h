@@ -26,6 +26,7 @@ public:
         float heel = 0.0f;          ///< how far that is below the ankle
         float sole = 0.0f;          ///< how far the sole's lower end is below the ankle
         float toeSole = 0.0f;       ///< how far the sole's toe end is below the target's toe joint
+        Vec3 knee = kVec3Zero;      ///< the knee of Stretch, relative to the line between hip and ankle
         Mat3 pitch = kMat3Identity; ///< rotation of the target's foot that makes up for its length
     };
 
@@ -44,6 +45,9 @@ public:
     /// that stands flat, in the target's scale; NaN for a foot without a toe.
     void ReadTarget(const CPoseMatcher& matcher, size_t frame, const ToePlace& moved);
 
+    /// Steadies the direction in which the knee is bent, which a nearly straight leg changes within a few
+    /// frames. All frames must have been read.
+    void SteadyKnee(double secondsPerFrame);
     /// Rotates the target's foot in a frame that has been read.
     void TurnFoot(size_t frame, const Mat3& turn);
 

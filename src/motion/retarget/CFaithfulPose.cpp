@@ -191,6 +191,8 @@ void CFaithfulPose::Plan(const std::vector<CKeyframeControl*>& tracks, const Vec
     }
     if (holdFeet)
     {
+        for (CFaithfulLeg& leg : m_kLegs)
+            leg.SteadyKnee(secondsPerFrame);
         YieldFeet(secondsPerFrame, flatDrop);
         SettleFeet(secondsPerFrame, flatDrop);
     }
@@ -226,12 +228,9 @@ Vec3 CFaithfulPose::KneePlace(size_t k, size_t frame, const Vec3& ankle) const
     const CFaithfulLeg& leg = m_kLegs[k];
     const auto offAt = [&](double bend) { return std::sqrt(SquareSlopeAt(leg.Lengths(), bend)); };
     const double more = offAt(BendAt(leg.Lengths(), Vec3Length(ankle))) - offAt(leg.KneeBend(frame));
-    const Vec3 sourceKnee = leg.At(frame).thigh * static_cast<float>(leg.Lengths().upper);
-    const Vec3 line = Vec3Normalized(leg.Stretch(frame));
-    const Vec3 sourceOff = sourceKnee - line * static_cast<float>(Vec3Dot(sourceKnee, line));
     const Vec3 forward =
         Vec3Normalized(leg.Forward(matcher_)) * (kForwardHint + static_cast<float>(std::max(more, 0.0)));
-    return MiddleJoint(leg.Lengths(), ankle, sourceOff + forward);
+    return MiddleJoint(leg.Lengths(), ankle, leg.At(frame).knee + forward);
 }
 
 void CFaithfulPose::WriteLeg(size_t k, size_t frame, const std::vector<CKeyframeControl*>& tracks)

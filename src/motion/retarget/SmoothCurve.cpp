@@ -1,6 +1,10 @@
 #include "SmoothCurve.h"
 
+#include "Figures.h"
+
 #include <cmath>
+#include <cstddef>
+#include <vector>
 
 namespace gw {
 
@@ -30,6 +34,30 @@ void SmoothCurve(std::span<float> curve, double frames)
     {
         LeakyMean(curve.begin(), curve.end(), keep);
         LeakyMean(curve.rbegin(), curve.rend(), keep);
+    }
+}
+
+void SteadySides(std::span<Vec3> sides, double far, double frames)
+{
+    std::vector<Vec3> smooth(sides.size());
+    std::vector<float> curve(sides.size());
+    for (Vec3& side : sides)
+    {
+        if (!std::isfinite(Vec3Dot(side, side)))
+            side = kVec3Zero;
+    }
+    for (float Vec3::*axis : {&Vec3::x, &Vec3::y, &Vec3::z})
+    {
+        for (size_t frame = 0; frame < sides.size(); ++frame)
+            curve[frame] = sides[frame].*axis;
+        SmoothCurve(curve, frames);
+        for (size_t frame = 0; frame < sides.size(); ++frame)
+            smooth[frame].*axis = curve[frame];
+    }
+    for (size_t frame = 0; frame < sides.size(); ++frame)
+    {
+        const auto kept = static_cast<float>(Smoothstep(Vec3Length(sides[frame]) / far));
+        sides[frame] = smooth[frame] + (sides[frame] - smooth[frame]) * kept;
     }
 }
 
