@@ -28,7 +28,7 @@ namespace {
 constexpr double kMostTurn = 0.15;     // radians; more would look like another foot
 constexpr double kMargin = 0.003;      // in leg lengths; joints should slide this much less than the source's
 constexpr double kTurnHertz = 2.5;     // of the changes of the turn
-constexpr double kTurnSeconds = 2.0;   // how long a foot keeps its turn if it stands
+constexpr double kTurnSeconds = 4.0;   // how long a foot keeps its turn if it stands
 constexpr double kLifted = 15.0;       // millimeters between ankle and toe of a foot that is clearly not flat
 constexpr double kFlatYield = 0.02;    // readiness of a flat foot to pitch; a lifted one has 1
 constexpr double kUsualHeight = 100.0; // millimeters between ankle and toe of a lifted foot
