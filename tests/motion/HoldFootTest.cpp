@@ -221,7 +221,7 @@ TEST(LandFoot, SoleIsOnTheFloorWhereItHasLandedAndHardlyBelowItElsewhere)
     EXPECT_NEAR(heights[90], -40.0 / 16.0, 1.0) << "a sixteenth of a dip stays";
     EXPECT_NEAR(heights[190], 30.0 / 9.0, 1.5) << "nearly on the floor";
     EXPECT_NEAR(heights[197], 30.0 / 9.0, 5.0) << "not dragged by a glitch";
-    EXPECT_NEAR(heights[270], 30.0 + 15.0 * 4.0 / 5.0, 1.5) << "nearly as high as it should be aloft";
+    EXPECT_NEAR(heights[270], 30.0 + 15.0 * 8.0 / 9.0, 1.5) << "nearly as high as it should be aloft";
     EXPECT_NEAR(heights[320], 60.0, 1.5) << "high enough already";
 }
 

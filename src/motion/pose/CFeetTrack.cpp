@@ -117,6 +117,8 @@ FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float 
     {
         const double speed = motion[frame].speed / (kSettledSpeed * m_fLegLength);
         touches.settled.push_back(touches.landed[frame] / static_cast<float>(1.0 + std::pow(speed, 4.0)));
+        const double low = std::min(ankleMotion[frame].height, toeMotion[frame].height);
+        touches.lowHeights.push_back(static_cast<float>(low / m_fLegLength));
         touches.ankleHeights.push_back(static_cast<float>(ankleMotion[frame].height / m_fLegLength));
     }
     return touches;

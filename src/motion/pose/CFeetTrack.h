@@ -24,6 +24,8 @@ struct FootTouches
     std::vector<float> aloft;
     /// Height of the higher of ankle and toe above its floor in leg lengths; one value per frame.
     std::vector<float> heights;
+    /// Same for the lower of the two.
+    std::vector<float> lowHeights;
     /// Height of the ankle above its floor in leg lengths; one value per frame.
     std::vector<float> ankleHeights;
     /// Confidence, 0 to 1, that the foot has landed and hardly moves; one value per frame.

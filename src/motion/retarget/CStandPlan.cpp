@@ -40,9 +40,10 @@ constexpr float kWristHeight = 30.0f;   // of a hand that is flat on the floor
 constexpr double kLeastToe = 10.0;      // from a source's toe joint down to its sole
 constexpr double kMostToeTurn = 0.08;   // radians; a toe end that is farther from the floor is left there
 constexpr double kToeReach = 10.0;      // beyond that, over which a toe end is pulled less and less
-constexpr double kToeWeight = 20.0;     // weight of a toe end on the floor; the foot's own pitch has weight 1
+constexpr double kToeWeight = 25.0;     // weight of a toe end on the floor; the foot's own pitch has weight 1
 constexpr double kToeHertz = 3.0;       // of the changes between the two
 constexpr double kSurelyAloft = 10.0;   // height of a foot that is certainly off the floor
+constexpr double kSlightLift = 15.0;    // of a sole; hardly seen
 constexpr double kAloftMargin = 0.004;  // in leg lengths, so that rounding does not put the foot on the floor
 constexpr double kMostAloft = 0.11;     // in leg lengths; above that, no foot stands
 constexpr double kLeastFirmness = 0.02; // minimum for any leg, however far its knee is bent
@@ -192,9 +193,10 @@ void CStandPlan::HoldLeg(size_t leg, const FootTouches& touches, double secondsP
     }
 }
 
-// Returns where the sole should be. A foot that is still but above the floor, on a step for example, is at
-// least as high as the source's. It may be lower on its free path, because the feet stand at several heights
-// and the plan has only one floor.
+// Returns where the sole should be. A foot that is still but above the floor, on a step for example, is as
+// far from standing as the source's: its higher joint is at least as high, without the sole being lifted
+// farther than the source's lower joint. It may be lower on its free path, because the feet stand at several
+// heights and the plan has only one floor.
 SoleWish CStandPlan::WishedSole(size_t leg, size_t frame, const FootTouches& touches) const
 {
     const CFaithfulLeg& of = legs_[leg];
@@ -202,7 +204,8 @@ SoleWish CStandPlan::WishedSole(size_t leg, size_t frame, const FootTouches& tou
     const float free = FreeSole(leg, frame);
     const float pitched = of.At(frame).sole - std::min(of.AnkleHeight(), of.ToeSole(frame));
     const double height = static_cast<double>(touches.heights[frame]) + kAloftMargin;
-    const double least = std::min(height, kMostAloft) * length - static_cast<double>(pitched);
+    const double most = static_cast<double>(touches.lowHeights[frame]) * length + kSlightLift;
+    const double least = std::min(std::min(height, kMostAloft) * length - static_cast<double>(pitched), most);
     const double aloft = static_cast<double>(touches.aloft[frame]) * Smoothstep(least / kSurelyAloft) *
                          Smoothstep(static_cast<double>(free) / kSurelyAloft);
     return {free, touches.landed[frame] * static_cast<float>(1.0 - aloft), static_cast<float>(aloft),

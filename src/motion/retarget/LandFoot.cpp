@@ -20,7 +20,7 @@ namespace {
 constexpr double kFullDip = 20.0;     // millimeters below the floor at which kDipWeight applies in full
 constexpr double kLandedWeight = 8.0; // weight of a sole that stands; the free path has weight 1
 constexpr double kDipWeight = 15.0;   // weight of a sole below the floor
-constexpr double kAloftWeight = 4.0;  // weight of a foot that is still but does not stand
+constexpr double kAloftWeight = 8.0;  // weight of a foot that is still but does not stand
 constexpr double kLandHertz = 1.4;    // of the changes between the two
 constexpr double kHover = 12.0;       // millimeters from the floor at which a landed sole is weighted double
 constexpr double kSunk = 6.0;         // millimeters below the floor at which a dip is weighted double
