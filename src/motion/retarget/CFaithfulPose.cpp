@@ -21,6 +21,8 @@ namespace {
 // one is many times farther from the line between hip and ankle.
 constexpr float kForwardHint = 3.0f;
 
+constexpr double kLeastDrop = 0.01; // millimeters by which lowering a toe is worth a rotation
+
 std::vector<LegJoints> TargetLegs(CNode* root)
 {
     std::vector<LegJoints> legs;
@@ -140,7 +142,10 @@ void CFaithfulPose::SettleFeet(double secondsPerFrame, double flatDrop)
         }
         const std::vector<double> drops = SettleFoot(wishes, secondsPerFrame);
         for (size_t frame = 0; frame < drops.size(); ++frame)
-            of.TurnFoot(frame, LoweredToe(of.At(frame).toe, drops[frame]));
+        {
+            if (std::fabs(drops[frame]) > kLeastDrop)
+                of.TurnFoot(frame, LoweredToe(of.At(frame).toe, drops[frame]));
+        }
     }
 }
 
