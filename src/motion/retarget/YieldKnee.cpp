@@ -32,7 +32,7 @@ namespace {
 constexpr int kSteps = 4;
 constexpr double kStopBend = 0.06;    // a knee slows down in the last 7 degrees before its stop
 constexpr double kLeastBend = 0.005;  // below this, rounding dominates
-constexpr double kExactSlope = 150.0; // millimeters per radian; a knee of 50 degrees is half exact
+constexpr double kExactSlope = 110.0; // millimeters per radian; a knee of 36 degrees is half exact
 constexpr double kMostBend = 0.9999;
 
 // Returns the change of the bend per unit of length in `direction`: 1 shortens the leg, -1 straightens it.
@@ -84,8 +84,8 @@ double YieldingBend(const LegLengths& leg, double asked, double bend, double sti
         const double second = BendFor(leg, ahead, slowBelow, stiffness, direction);
         taken = std::clamp(taken + 0.5 * step * (first + second), 0.0, kMostBend);
     }
-    const double slope = SquareSlopeAt(leg, taken);
-    taken += slope / (slope + kExactSlope * kExactSlope) * (BendAt(leg, asked) - taken);
+    const double slope = SquareSlopeAt(leg, taken) / (kExactSlope * kExactSlope);
+    taken += slope * slope / (slope * slope + 1.0) * (BendAt(leg, asked) - taken);
     return std::sqrt(taken * taken + kLeastBend * kLeastBend);
 }
 
