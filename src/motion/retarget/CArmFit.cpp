@@ -10,14 +10,15 @@
 namespace gw {
 
 CArmFit::CArmFit(size_t sampleCount, const Values& scales, double bend)
-    : m_kScales(scales), m_kRows(sampleCount * kValues, Row{}), m_kWanted(sampleCount * kValues, 0.0)
+    : m_kScales(scales), m_uiCount(sampleCount * kValues), m_kRows(m_uiCount + kPadding, Row{}),
+      m_kWanted(m_uiCount + kPadding, 0.0)
 {
     constexpr double kSecond[] = {1.0, -2.0, 1.0};
-    for (size_t row = 0; row < m_kRows.size(); ++row)
+    for (size_t row = 0; row < m_uiCount; ++row)
     {
         const double scale = scales[row % kValues];
         m_kRows[row][0] += scale;
-        if (row + 2 * kValues >= m_kRows.size())
+        if (row + 2 * kValues >= m_uiCount)
             continue;
         for (size_t i = 0; i < 3; ++i)
         {
@@ -55,15 +56,15 @@ void CArmFit::AddPull(size_t sample, double weight, const Values& wanted)
 // Leaves D in the first column of the rows and D · U behind it, and applies the elimination to m_kWanted.
 void CArmFit::Factor()
 {
-    const size_t count = m_kRows.size();
-    for (size_t row = 0; row < count; ++row)
+    for (size_t row = 0; row < m_uiCount; ++row)
     {
-        const Row& pivot = m_kRows[row];
-        for (size_t below = 1; below < std::min(kBand, count - row); ++below)
+        const Row pivot = m_kRows[row];
+#pragma GCC unroll 10
+        for (size_t below = 1; below < kBand; ++below)
         {
-            const double factor = pivot[below] / pivot[0];
-            if (factor == 0.0)
+            if (pivot[below] == 0.0)
                 continue;
+            const double factor = pivot[below] / pivot[0];
             Row& other = m_kRows[row + below];
             for (size_t column = below; column < kBand; ++column)
                 other[column - below] -= factor * pivot[column];
@@ -75,11 +76,10 @@ void CArmFit::Factor()
 std::vector<CArmFit::Values> CArmFit::Solve()
 {
     Factor();
-    const size_t count = m_kRows.size();
-    std::vector<Values> curves(count / kValues);
-    for (size_t row = count; row-- > 0;)
+    std::vector<Values> curves(m_uiCount / kValues);
+    for (size_t row = m_uiCount; row-- > 0;)
     {
-        for (size_t ahead = 1; ahead < std::min(kBand, count - row); ++ahead)
+        for (size_t ahead = 1; ahead < kBand; ++ahead)
             m_kWanted[row] -= m_kRows[row][ahead] * m_kWanted[row + ahead];
         m_kWanted[row] /= m_kRows[row][0];
         curves[row / kValues][row % kValues] = m_kWanted[row];

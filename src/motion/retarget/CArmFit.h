@@ -34,10 +34,13 @@ private:
     // A row of the upper half of the matrix, from the diagonal on; what is two samples farther is zero.
     static constexpr size_t kBand = 2 * kValues + 1;
     using Row = std::array<double, kBand>;
+    // Zero rows after the last one, so that loops over a row's band have constant bounds and get unrolled.
+    static constexpr size_t kPadding = kBand - 1;
 
     void Factor();
 
     Values m_kScales;
+    size_t m_uiCount; // of rows, without the padding
     std::vector<Row> m_kRows;
     std::vector<double> m_kWanted;
 };

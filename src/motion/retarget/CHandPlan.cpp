@@ -124,6 +124,11 @@ double WeightOf(double distance, double thickness)
     return (1.0 - Smoothstep((gap - kTouch) / kFade)) * kNear / (kNear + std::max(gap, 0.0));
 }
 
+bool IsNear(double distance, double thickness)
+{
+    return distance - thickness < kTouch + kFade;
+}
+
 // Returns the right distance that is nearest to a given one.
 double RightDistance(double distance, double source, double thickness)
 {
@@ -224,15 +229,14 @@ size_t CHandPlan::FrameOf(size_t sample) const
 
 bool CHandPlan::Touches(const TouchPoints& source) const
 {
-    const auto isNear = [](double distance, double thickness) { return WeightOf(distance, thickness) > 0.0; };
-    if (isNear(Vec3Length(source.hands[0] - source.hands[1]), kHand))
+    if (IsNear(Vec3Length(source.hands[0] - source.hands[1]), kHand))
         return true;
+    const auto things = ThingsOf(source, source);
     return std::ranges::any_of(source.hands, [&](const Vec3& hand) {
-        const auto things = ThingsOf(source, source);
         return (m_bHasFloor && static_cast<double>(hand.y) < kLowHand) ||
-               isNear(Vec3Length(hand - source.head), kHead + static_cast<double>(kHeadMiddle)) ||
+               IsNear(Vec3Length(hand - source.head), kHead + static_cast<double>(kHeadMiddle)) ||
                std::ranges::any_of(things, [&](const Thing& thing) {
-                   return isNear(thing.source.Distance(hand), thing.thickness);
+                   return IsNear(thing.source.Distance(hand), thing.thickness);
                });
     });
 }
@@ -269,22 +273,25 @@ bool CHandPlan::AddRequests(CArmFit& fit, size_t sample, const Pose& pose, size_
     const auto ask = [&](const Vec3& sourceWay, const Vec3& way, double thickness, double share,
                          const Vec3& axis) {
         const double sourceDistance = Vec3Length(sourceWay);
-        const double weight = WeightOf(sourceDistance, thickness);
-        if (!(weight > 0.0))
-            return;
         any = true;
         const Vec3 direction = Vec3Normalized(fromSourceSide ? way + sourceWay * kSourceSide : way);
         const double now = Vec3Dot(direction, way);
         const double right = RightDistance(now, sourceDistance, thickness);
-        arm.AskDistance(weight, way, direction, now + (right - now) * share, axis);
+        arm.AskDistance(WeightOf(sourceDistance, thickness), way, direction, now + (right - now) * share,
+                        axis);
     };
     for (const Thing& thing : ThingsOf(pose.source, pose.target))
     {
+        const Vec3 sourceWay = sourceHand - thing.source.Nearest(sourceHand);
+        if (!IsNear(Vec3Length(sourceWay), thing.thickness))
+            continue;
         const Vec3 nearest = thing.target.Nearest(hand);
-        ask(sourceHand - thing.source.Nearest(sourceHand), hand - nearest, thing.thickness, 1.0,
+        ask(sourceWay, hand - nearest, thing.thickness, 1.0,
             thing.target.IsInside(nearest) ? thing.target.to - thing.target.from : kVec3Zero);
     }
-    ask(sourceHand - pose.source.hands[1 - side], hand - pose.moved.hands[1 - side], kHand, 0.5, kVec3Zero);
+    const Vec3 sourceApart = sourceHand - pose.source.hands[1 - side];
+    if (IsNear(Vec3Length(sourceApart), kHand))
+        ask(sourceApart, hand - pose.moved.hands[1 - side], kHand, 0.5, kVec3Zero);
 
     const auto height = static_cast<double>(hand.y);
     const auto sourceHeight = static_cast<double>(sourceHand.y);
@@ -298,7 +305,8 @@ bool CHandPlan::AddRequests(CArmFit& fit, size_t sample, const Pose& pose, size_
     return true;
 }
 
-void CHandPlan::Fit(const Run& run, size_t side, bool fromSourceSide)
+// Returns whether the hand is near anything.
+bool CHandPlan::Fit(const Run& run, size_t side, bool fromSourceSide)
 {
     CArmFit fit(run.endSample - run.firstSample, kArmScales, BendWeight(kHandHertz, m_fSecondsPerSample));
     bool any = false;
@@ -312,6 +320,7 @@ void CHandPlan::Fit(const Run& run, size_t side, bool fromSourceSide)
     if (any)
         std::ranges::copy(fit.Solve(),
                           m_kValues[side].begin() + static_cast<std::ptrdiff_t>(run.firstSample));
+    return any;
 }
 
 // Returns how far the hand moves.
@@ -332,16 +341,19 @@ void CHandPlan::Solve()
     for (const Run& run : Runs())
     {
         double step = 0.0;
+        std::array<bool, 2> moves = {true, true}; // a hand that is near nothing is done after the first round
         for (int round = 0; round == 0 || (round < kHandRounds && step > kLastStep); ++round)
         {
             step = 0.0;
+            std::array<bool, 2> fits{};
             for (size_t side = 0; side < m_kValues.size(); ++side)
-                Fit(run, side, round == 0);
+                fits[side] = moves[side] && Fit(run, side, round == 0);
             for (size_t i = run.firstPose; i < run.endPose; ++i)
             {
                 for (size_t side = 0; side < m_kValues.size(); ++side)
-                    step = std::max(step, Move(m_kPoses[i], side));
+                    step = moves[side] ? std::max(step, Move(m_kPoses[i], side)) : step;
             }
+            moves = fits;
         }
     }
     m_kPoses.clear();

@@ -72,7 +72,7 @@ private:
 
     std::vector<Run> Runs() const;
     bool AddRequests(CArmFit& fit, size_t sample, const Pose& pose, size_t side, bool fromSourceSide) const;
-    void Fit(const Run& run, size_t side, bool fromSourceSide);
+    bool Fit(const Run& run, size_t side, bool fromSourceSide);
     double Move(Pose& pose, size_t side) const;
 
     std::array<LegLengths, 2> m_kArms;
