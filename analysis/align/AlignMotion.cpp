@@ -31,6 +31,25 @@ Vec3 Scaled(const Vec3& v, const Vec3& scale)
     return {v.x * scale.x, v.y * scale.y, v.z * scale.z};
 }
 
+// The first three rows of a transform: unit vectors and their lengths.
+struct UnitRows
+{
+    Mat3 rotation;
+    Vec3 lengths;
+};
+
+// Returns NormalizedRows and RowLengths, but measures each row only once.
+UnitRows UnitRowsOf(const Mat4& m)
+{
+    const double lengths[] = {Vec3Length(m.Row(0)), Vec3Length(m.Row(1)), Vec3Length(m.Row(2))};
+    UnitRows rows{{},
+                  {static_cast<float>(lengths[0]), static_cast<float>(lengths[1]),
+                   static_cast<float>(lengths[2])}};
+    for (int row = 0; row < 3; ++row)
+        rows.rotation.SetRow(row, Vec3DividedBy(m.Row(row), lengths[row]));
+    return rows;
+}
+
 class CMotionAligner
 {
 public:
@@ -62,6 +81,7 @@ private:
     AlignedMotion m_kResult;
     std::vector<CKeyframeControl*> m_kTracks; // null if a joint does not move
     std::vector<Vec3> m_kScales;              // world scale of each joint at the frame
+    std::vector<Mat3> m_kBackTurns;           // the inverse of each joint's turn
 };
 
 void CMotionAligner::AddJoint(const JointAlignment& joint)
@@ -77,6 +97,7 @@ void CMotionAligner::AddJoint(const JointAlignment& joint)
     node->m_kMatrix.SetTranslation(offset);
     AddBone(joint, *node);
     m_kTracks.push_back(Moves(joint) ? &AddTrack(*node) : nullptr);
+    m_kBackTurns.push_back(Mat3Transpose(joint.turn));
 }
 
 CKeyframeControl& CMotionAligner::AddTrack(CNode& node)
@@ -104,14 +125,15 @@ void CMotionAligner::AddKey(size_t index, int frame)
 {
     const JointAlignment& joint = alignment_.joints[index];
     const Mat4& local = joint.node->m_kMatrix;
+    const Mat3& parentTurn = ParentTurn(joint);
+    const UnitRows rows = UnitRowsOf(local);
     CKeyframeControl& track = *m_kTracks[index];
-    track.m_kRotationKeys.push_back(
-        QuatFromMat3(Mat3Transpose(joint.turn) * NormalizedRows(local) * ParentTurn(joint)));
+    track.m_kRotationKeys.push_back(QuatFromMat3(m_kBackTurns[index] * rows.rotation * parentTurn));
 
     const Vec3 above = joint.parent < 0 ? kVec3One : m_kScales[static_cast<size_t>(joint.parent)];
-    m_kScales[index] = Scaled(above, RowLengths(local));
+    m_kScales[index] = Scaled(above, rows.lengths);
     const Vec3 once = joint.tellOnce ? joint.restOffset : kVec3Zero;
-    const Vec3 position = Turned(Scaled(local.Translation() - once, above), ParentTurn(joint));
+    const Vec3 position = Turned(Scaled(local.Translation() - once, above), parentTurn);
     CKeyArray<Vec3>& keys = track.m_kPositionKeys;
     const Vec3 still = keys.empty() ? track.m_kRestMatrix.Translation() : keys.front();
     const double same = (joint.tellOnce ? kSameRepeated : kSamePosition) * Vec3Length(still);

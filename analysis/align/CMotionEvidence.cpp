@@ -77,10 +77,14 @@ double StanceError(const CBodyMap& body, const Vec3& up)
     return error.Mean();
 }
 
-void WatchBody(const CBodyMap& body, CPoseSampler& sampler)
+void WatchTrunk(const CBodyMap& body, CPoseSampler& sampler)
 {
     for (CNode* joint : {body.hip, body.head, TrunkTop(body)})
         sampler.Watch(joint);
+}
+
+void WatchLimbs(const CBodyMap& body, CPoseSampler& sampler)
+{
     for (const BodyArm& arm : body.arms)
     {
         for (CNode* joint : {arm.upperArm, arm.forearm, arm.hand})
@@ -114,7 +118,9 @@ CMotionEvidence::CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn
 void CMotionEvidence::Walk(const BodyMotion& motion, const Mat3& worldTurn, bool seeksFrame)
 {
     CPoseSampler sampler(motion.frequency);
-    WatchBody(motion.body, sampler);
+    if (seeksFrame)
+        WatchTrunk(motion.body, sampler);
+    WatchLimbs(motion.body, sampler);
     for (const Way& way : m_kWays)
         sampler.Watch(way.joints.to);
     CSoleMeter soles(motion.body, worldTurn);

@@ -12,6 +12,7 @@
 #include <algorithm>
 #include <cmath>
 #include <limits>
+#include <set>
 
 namespace gw {
 
@@ -58,6 +59,15 @@ std::vector<LegJoints> SourcesOf(const std::vector<CFaithfulLeg>& legs)
     return sources;
 }
 
+// Returns the bones of all legs in the matcher's order, in which parents come first.
+std::vector<size_t> BonesOf(const std::vector<CFaithfulLeg>& legs)
+{
+    std::set<size_t> bones;
+    for (const CFaithfulLeg& leg : legs)
+        bones.insert(leg.Path().begin(), leg.Path().end());
+    return {bones.begin(), bones.end()};
+}
+
 bool IsFinite(const Vec3& v)
 {
     return std::isfinite(v.x) && std::isfinite(v.y) && std::isfinite(v.z);
@@ -68,7 +78,7 @@ bool IsFinite(const Vec3& v)
 CFaithfulPose::CFaithfulPose(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot,
                              bool holdHands)
     : matcher_(matcher), m_kTrunk(retargeter, matcher, targetRoot),
-      m_kLegs(PlanLegs(retargeter, matcher, targetRoot)),
+      m_kLegs(PlanLegs(retargeter, matcher, targetRoot)), m_kBones(BonesOf(m_kLegs)),
       m_kSource(retargeter.SourceOf(targetRoot), SourcesOf(m_kLegs)),
       m_kHands(retargeter, matcher, holdHands ? targetRoot : nullptr, m_kLegs)
 {
@@ -95,15 +105,12 @@ void CFaithfulPose::Append()
 // float position is too coarse for the height of a sole.
 void CFaithfulPose::PoseFrame(size_t frame, const std::vector<CKeyframeControl*>& tracks)
 {
-    for (const CFaithfulLeg& leg : m_kLegs)
+    for (const size_t index : m_kBones)
     {
-        for (const size_t index : leg.Path())
-        {
-            CPoseMatcher::Bone& bone = matcher_.Bones()[index];
-            bone.rotation = QuatToMat3(tracks[index]->m_kRotationKeys[frame]);
-            bone.translation = bone.parent < 0 ? kVec3Zero : tracks[index]->m_kPositionKeys[frame];
-            matcher_.UpdateWorld(index);
-        }
+        CPoseMatcher::Bone& bone = matcher_.Bones()[index];
+        bone.rotation = QuatToMat3(tracks[index]->m_kRotationKeys[frame]);
+        bone.translation = bone.parent < 0 ? kVec3Zero : tracks[index]->m_kPositionKeys[frame];
+        matcher_.UpdateWorld(index);
     }
 }
 

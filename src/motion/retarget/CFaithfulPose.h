@@ -59,6 +59,7 @@ private:
     CPoseMatcher& matcher_;
     CTrunkAim m_kTrunk;
     std::vector<CFaithfulLeg> m_kLegs;
+    std::vector<size_t> m_kBones; // of the legs, from the root down
     CSourceBody m_kSource;
     CFaithfulHands m_kHands;
     std::optional<CStandPlan> plan_;

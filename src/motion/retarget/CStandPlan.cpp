@@ -169,6 +169,8 @@ void CStandPlan::HoldLeg(size_t leg, const FootTouches& touches, double secondsP
 {
     std::vector<Vec3> free;
     std::vector<Vec3> toe;
+    free.reserve(m_kRoots.size());
+    toe.reserve(m_kRoots.size());
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
     {
         free.push_back(FreeAnkle(leg, frame));
@@ -216,6 +218,8 @@ void CStandPlan::LandLeg(size_t leg, const FootTouches& touches, double secondsP
 {
     std::vector<SoleWish> wishes;
     std::vector<float> landed;
+    wishes.reserve(m_kRoots.size());
+    landed.reserve(m_kRoots.size());
     for (size_t frame = 0; frame < m_kRoots.size(); ++frame)
     {
         wishes.push_back(WishedSole(leg, frame, touches));
@@ -285,13 +289,15 @@ void CStandPlan::LowerToe(size_t leg, double secondsPerFrame)
         if (landed > 0.0)
             drops.AddValue(frame, kToeWeight * landed, WantedToeDrop(leg, frame));
     }
-    m_kToeDrops.push_back(drops.Solve());
+    std::vector<Mat3>& turns = m_kToeTurns.emplace_back();
+    turns.reserve(m_kRoots.size());
+    for (const double drop : drops.Solve())
+        turns.push_back(LoweredToe(legs_[leg].At(turns.size()).toe, drop));
 }
 
-Mat3 CStandPlan::ToeTurn(size_t leg, size_t frame) const
+const Mat3& CStandPlan::ToeTurn(size_t leg, size_t frame) const
 {
-    return leg < m_kToeDrops.size() ? LoweredToe(legs_[leg].At(frame).toe, m_kToeDrops[leg][frame])
-                                    : kMat3Identity;
+    return leg < m_kToeTurns.size() ? m_kToeTurns[leg][frame] : kMat3Identity;
 }
 
 Vec3 CStandPlan::Ankle(size_t leg, size_t frame) const

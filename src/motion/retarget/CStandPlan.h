@@ -27,7 +27,7 @@ public:
     /// Returns the ankle relative to the hip of the same leg; it is always within the leg's reach.
     Vec3 Ankle(size_t leg, size_t frame) const;
     /// Returns a rotation by a few degrees that brings the toe end of a foot's sole to the floor.
-    Mat3 ToeTurn(size_t leg, size_t frame) const;
+    const Mat3& ToeTurn(size_t leg, size_t frame) const;
     /// Converts a position of the source to the target's scale and floor height. The horizontal position is
     /// only scaled, not moved to where the target is.
     Vec3 OnTarget(const Vec3& place) const;
@@ -58,8 +58,8 @@ private:
     std::vector<Vec3> m_kRoots;
     std::vector<float> m_kLifts;              // the part of the roots' heights that was added for the legs
     std::vector<std::vector<Vec3>> m_kAnkles; // by leg and frame; empty if feet are not held
-    std::vector<std::vector<double>> m_kToeDrops; // relative to the ankle; empty until they are planned
-    std::vector<std::vector<float>> m_kLanded;    // confidence that a sole is on the floor
+    std::vector<std::vector<Mat3>> m_kToeTurns; // empty until they are planned
+    std::vector<std::vector<float>> m_kLanded;  // confidence that a sole is on the floor
 };
 
 } // namespace gw
