@@ -61,19 +61,27 @@ void CFeetTrack::MeasureLegs()
     m_fLegLength = lengths.Mean();
 }
 
-void CFeetTrack::FindAloft(const std::vector<FootMotion>& motion, FootTouches& touches) const
+// Sets how surely the sole has landed. Without a frame in which ankle and toe stand together, a contact whose
+// joints stay above the floor hovers.
+void CFeetTrack::FindLanded(const FloorPath& ankle, const FloorPath& toe, FootTouches& touches) const
 {
-    for (const FootMotion& of : motion)
+    for (const Contact& contact : touches.contacts)
     {
-        const double height = of.height / m_fLegLength;
-        const double moves =
-            Smoothstep((of.speed / m_fLegLength - kStandSpeed) / (kLeaveSpeed - kStandSpeed));
-        const double rises = Smoothstep((height - kHoverHeight) / (kStandHeight - kHoverHeight));
-        touches.aloft.push_back(static_cast<float>((1.0 - moves) * rises));
-        touches.heights.push_back(static_cast<float>(height));
+        double height = kHoverHeight;
+        for (auto frame = static_cast<size_t>(contact.first); frame < static_cast<size_t>(contact.end);
+             ++frame)
+        {
+            const float above =
+                std::min(ankle.positions[frame].y - ankle.floor, toe.positions[frame].y - toe.floor);
+            height = std::min(height, static_cast<double>(above) / m_fLegLength);
+        }
+        const bool isFlat = std::ranges::any_of(touches.flat, [&](const Contact& other) {
+            return contact.first <= other.first && other.end <= contact.end;
+        });
+        const double hovers = isFlat ? 0.0 : Smoothstep((height - kLowHeight) / (kHoverHeight - kLowHeight));
+        for (int frame = contact.first; frame < contact.end; ++frame)
+            touches.states[static_cast<size_t>(frame)].landed = static_cast<float>(1.0 - hovers);
     }
-    for (const Contact& contact : touches.flat)
-        std::fill(touches.aloft.begin() + contact.first, touches.aloft.begin() + contact.end, 0.0f);
 }
 
 FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float toeFloor,
@@ -91,35 +99,29 @@ FootTouches CFeetTrack::TouchesOf(const CLegTrack& leg, float ankleFloor, float 
     touches.ankle = find(ankleMotion);
     touches.toe = find(toeMotion);
     touches.contacts = MergedContacts(touches.ankle, touches.toe);
-    touches.landed.assign(ankle.positions.size(), 0.0f);
     touches.flat = find(motion);
-    FindAloft(motion, touches);
     if (!leg.HasToe())
         touches.toe.clear();
-    for (const Contact& contact : touches.contacts)
-    {
-        double height = kHoverHeight;
-        for (auto frame = static_cast<size_t>(contact.first); frame < static_cast<size_t>(contact.end);
-             ++frame)
-        {
-            const float above =
-                std::min(ankle.positions[frame].y - ankleFloor, toe.positions[frame].y - toe.floor);
-            height = std::min(height, static_cast<double>(above) / m_fLegLength);
-        }
-        const bool isFlat = std::ranges::any_of(touches.flat, [&](const Contact& other) {
-            return contact.first <= other.first && other.end <= contact.end;
-        });
-        const double hovers = isFlat ? 0.0 : Smoothstep((height - kLowHeight) / (kHoverHeight - kLowHeight));
-        std::fill(touches.landed.begin() + contact.first, touches.landed.begin() + contact.end,
-                  static_cast<float>(1.0 - hovers));
-    }
+    touches.states.resize(motion.size());
+    FindLanded(ankle, toe, touches);
     for (size_t frame = 0; frame < motion.size(); ++frame)
     {
-        const double speed = motion[frame].speed / (kSettledSpeed * m_fLegLength);
-        touches.settled.push_back(touches.landed[frame] / static_cast<float>(1.0 + std::pow(speed, 4.0)));
-        const double low = std::min(ankleMotion[frame].height, toeMotion[frame].height);
-        touches.lowHeights.push_back(static_cast<float>(low / m_fLegLength));
-        touches.ankleHeights.push_back(static_cast<float>(ankleMotion[frame].height / m_fLegLength));
+        FootState& state = touches.states[frame];
+        const double speed = motion[frame].speed / m_fLegLength;
+        const double height = motion[frame].height / m_fLegLength;
+        const double low = std::min(ankleMotion[frame].height, toeMotion[frame].height) / m_fLegLength;
+        const double moves = Smoothstep((speed - kStandSpeed) / (kLeaveSpeed - kStandSpeed));
+        const double rises = Smoothstep((height - kHoverHeight) / (kStandHeight - kHoverHeight));
+        state.settled = state.landed / static_cast<float>(1.0 + std::pow(speed / kSettledSpeed, 4.0));
+        state.aloft = static_cast<float>((1.0 - moves) * rises);
+        state.height = static_cast<float>(height);
+        state.lowHeight = static_cast<float>(low);
+        state.ankleHeight = static_cast<float>(ankleMotion[frame].height / m_fLegLength);
+    }
+    for (const Contact& contact : touches.flat)
+    {
+        for (int frame = contact.first; frame < contact.end; ++frame)
+            touches.states[static_cast<size_t>(frame)].aloft = 0.0f;
     }
     return touches;
 }

@@ -9,31 +9,29 @@ namespace gw {
 
 class CPoseSampler;
 
-/// When one foot touches the floor.
+/// How a foot stands in a frame. Confidences are 0 to 1, heights in leg lengths above the joint's own floor.
+struct FootState
+{
+    /// Confidence that the sole is on the floor. It is 1 in a contact in which ankle and toe stand together,
+    /// less if only one stands and hovers, and 0 outside of contacts.
+    float landed = 0.0f;
+    float settled = 0.0f;     ///< confidence that the foot has landed and hardly moves
+    float aloft = 0.0f;       ///< confidence that the foot is still without standing
+    float height = 0.0f;      ///< of the higher of ankle and toe
+    float lowHeight = 0.0f;   ///< of the lower of the two
+    float ankleHeight = 0.0f; ///< of the ankle
+};
+
+/// When a foot touches the floor.
 struct FootTouches
 {
     /// Frames in which the ankle or the toe stands, whatever the other does: for example, a heel that has
     /// come down or a ball that pushes off.
     std::vector<Contact> contacts;
-    /// Confidence, 0 to 1, that the sole is on the floor; one value per frame. It is 1 in a contact in which
-    /// ankle and toe stand together, less if only one stands and hovers, and 0 outside of contacts.
-    std::vector<float> landed;
-    /// Frames in which ankle and toe stand together.
-    std::vector<Contact> flat;
-    /// Confidence, 0 to 1, that the foot is still without standing; one value per frame.
-    std::vector<float> aloft;
-    /// Height of the higher of ankle and toe above its floor in leg lengths; one value per frame.
-    std::vector<float> heights;
-    /// Same for the lower of the two.
-    std::vector<float> lowHeights;
-    /// Height of the ankle above its floor in leg lengths; one value per frame.
-    std::vector<float> ankleHeights;
-    /// Confidence, 0 to 1, that the foot has landed and hardly moves; one value per frame.
-    std::vector<float> settled;
-    /// Frames in which the ankle stands, whatever the toe does.
-    std::vector<Contact> ankle;
-    /// Same for the toe; empty for a foot without one.
-    std::vector<Contact> toe;
+    std::vector<Contact> flat;     ///< frames in which ankle and toe stand together
+    std::vector<Contact> ankle;    ///< frames in which the ankle stands, whatever the toe does
+    std::vector<Contact> toe;      ///< same for the toe; empty for a foot without one
+    std::vector<FootState> states; ///< one per frame
 };
 
 /// Returns the height at which a joint, `Ankles` or `Toes`, of all legs stands on the floor.
@@ -63,7 +61,7 @@ public:
     std::vector<FootTouches> Touches(double secondsPerFrame) const;
 
 private:
-    void FindAloft(const std::vector<FootMotion>& motion, FootTouches& touches) const;
+    void FindLanded(const FloorPath& ankle, const FloorPath& toe, FootTouches& touches) const;
     FootTouches TouchesOf(const CLegTrack& leg, float ankleFloor, float toeFloor,
                           double secondsPerFrame) const;
 

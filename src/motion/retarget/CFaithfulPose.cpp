@@ -143,9 +143,9 @@ void CFaithfulPose::SettleFeet(double secondsPerFrame, double flatDrop)
         for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
         {
             const double heel = -ToeMoved(leg, frame, flatDrop).height;
-            const double ankle = std::max(static_cast<double>(touch.ankleHeights[frame]) * length, 0.0);
+            const double ankle = std::max(static_cast<double>(touch.states[frame].ankleHeight) * length, 0.0);
             wishes.push_back({of.At(frame).toe, of.FlatDrop() + (heel < ankle ? heel : ankle),
-                              static_cast<double>(touch.settled[frame])});
+                              static_cast<double>(touch.states[frame].settled)});
         }
         const std::vector<double> drops = SettleFoot(wishes, secondsPerFrame);
         for (size_t frame = 0; frame < drops.size(); ++frame)

@@ -81,10 +81,10 @@ float CSourceBody::Floor(double leastToe) const
 
 void CSourceBody::FindTouches(double secondsPerFrame)
 {
-    const std::vector<float> none(FrameCount(), 0.0f);
-    m_kTouches = HasLegs() ? m_kFeet.Touches(secondsPerFrame)
-                           : std::vector<FootTouches>(m_kLegs.size(),
-                                                      {{}, none, {}, none, none, none, none, none, {}, {}});
+    FootTouches none;
+    none.states.resize(FrameCount());
+    m_kTouches =
+        HasLegs() ? m_kFeet.Touches(secondsPerFrame) : std::vector<FootTouches>(m_kLegs.size(), none);
     m_kJumps.clear();
     for (size_t frame = 0; frame + 1 < FrameCount(); ++frame)
     {

@@ -135,8 +135,8 @@ void CStandPlan::StandOnFloor(const std::vector<FootTouches>& touches, float low
             all.push_back(-FreeSole(leg, frame));
     }
     const bool stands = !standing.empty();
-    float lift = stands ? Percentile(std::move(standing), 0.5)
-                        : Percentile(std::move(all), 1.0 - kFloorShare);
+    float lift =
+        stands ? Percentile(std::move(standing), 0.5) : Percentile(std::move(all), 1.0 - kFloorShare);
     const float hands = kWristHeight - (lowestHand - source_.Hips(0).y) * static_cast<float>(m_fScale);
     if (!stands && std::isfinite(hands) && hands > lift)
     {
@@ -202,15 +202,16 @@ void CStandPlan::HoldLeg(size_t leg, const FootTouches& touches, double secondsP
 SoleWish CStandPlan::WishedSole(size_t leg, size_t frame, const FootTouches& touches) const
 {
     const CFaithfulLeg& of = legs_[leg];
+    const FootState& state = touches.states[frame];
     const double length = of.Lengths().upper + of.Lengths().lower;
     const float free = FreeSole(leg, frame);
     const float pitched = of.At(frame).sole - std::min(of.AnkleHeight(), of.ToeSole(frame));
-    const double height = static_cast<double>(touches.heights[frame]) + kAloftMargin;
-    const double most = static_cast<double>(touches.lowHeights[frame]) * length + kSlightLift;
+    const double height = static_cast<double>(state.height) + kAloftMargin;
+    const double most = static_cast<double>(state.lowHeight) * length + kSlightLift;
     const double least = std::min(std::min(height, kMostAloft) * length - static_cast<double>(pitched), most);
-    const double aloft = static_cast<double>(touches.aloft[frame]) * Smoothstep(least / kSurelyAloft) *
+    const double aloft = static_cast<double>(state.aloft) * Smoothstep(least / kSurelyAloft) *
                          Smoothstep(static_cast<double>(free) / kSurelyAloft);
-    return {free, touches.landed[frame] * static_cast<float>(1.0 - aloft), static_cast<float>(aloft),
+    return {free, state.landed * static_cast<float>(1.0 - aloft), static_cast<float>(aloft),
             static_cast<float>(least)};
 }
 
