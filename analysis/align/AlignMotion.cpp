@@ -42,9 +42,10 @@ struct UnitRows
 UnitRows UnitRowsOf(const Mat4& m)
 {
     const double lengths[] = {Vec3Length(m.Row(0)), Vec3Length(m.Row(1)), Vec3Length(m.Row(2))};
-    UnitRows rows{{},
-                  {static_cast<float>(lengths[0]), static_cast<float>(lengths[1]),
-                   static_cast<float>(lengths[2])}};
+    UnitRows rows{
+        {                              },
+        { static_cast<float>(lengths[0]), static_cast<float>(lengths[1]), static_cast<float>(lengths[2])}
+    };
     for (int row = 0; row < 3; ++row)
         rows.rotation.SetRow(row, Vec3DividedBy(m.Row(row), lengths[row]));
     return rows;

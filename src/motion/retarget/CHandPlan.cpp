@@ -30,6 +30,7 @@
 #include <algorithm>
 #include <cmath>
 #include <numeric>
+#include <optional>
 
 namespace gw {
 
@@ -145,7 +146,7 @@ public:
                  const ArmPoints& moved, size_t side, const CArmFit::Values& now)
         : fit_(fit), m_uiSample(sample), arm_(arm), up_(target.chestUp), now_(now),
           m_kArm(moved.hands[side] - moved.shoulders[side]), m_kLine(Vec3Normalized(m_kArm)),
-          m_fElbow(ElbowAt(arm, Vec3Length(m_kArm))),
+          m_fElbow(ElbowAt(arm, Vec3Length(m_kArm))), m_fSlope(SlopeAt(m_fElbow)),
           m_fCollar(Vec3Length(target.shoulders[side] - target.collars[side]))
     {
     }
@@ -154,9 +155,7 @@ public:
     void Ask(double weight, const Vec3& direction, double farther) const
     {
         const double along = Vec3Dot(direction, m_kLine);
-        const double elbow = farther * along < 0.0 ? std::hypot(m_fElbow, kFoldingElbow) : m_fElbow;
-        const double slope =
-            -arm_.upper * arm_.lower * std::sin(elbow) / std::max(ReachAtElbow(arm_, elbow), 1.0);
+        const double slope = farther * along < 0.0 ? SlopeAt(std::hypot(m_fElbow, kFoldingElbow)) : m_fSlope;
         const Vec3 lever = Vec3Cross(m_kArm, direction);
         const CArmFit::Values coefficients = {lever.x, lever.y, lever.z, along * slope,
                                               Vec3Dot(direction, up_) * m_fCollar};
@@ -185,6 +184,11 @@ public:
     }
 
 private:
+    // Returns how far the hand moves along the arm per radian of the elbow.
+    double SlopeAt(double elbow) const
+    {
+        return -arm_.upper * arm_.lower * std::sin(elbow) / std::max(ReachAtElbow(arm_, elbow), 1.0);
+    }
     static Vec3 NotAlong(const Vec3& direction)
     {
         return std::fabs(direction.y) < 0.8f ? kVec3UnitY : kVec3UnitX;
@@ -198,6 +202,7 @@ private:
     Vec3 m_kArm;
     Vec3 m_kLine;
     double m_fElbow;
+    double m_fSlope;
     double m_fCollar;
 };
 
@@ -267,18 +272,20 @@ bool CHandPlan::AddRequests(CArmFit& fit, size_t sample, const Pose& pose, size_
 {
     const Vec3& hand = pose.moved.hands[side];
     const Vec3& sourceHand = pose.source.hands[side];
-    const CArmRequests arm(fit, sample, m_kArms[side], pose.target, pose.moved, side,
-                           m_kValues[side][pose.sample]);
-    bool any = false;
+    std::optional<CArmRequests> made; // in most poses, at most one of the hands is near anything
+    const auto arm = [&]() -> const CArmRequests& {
+        return made ? *made
+                    : made.emplace(fit, sample, m_kArms[side], pose.target, pose.moved, side,
+                                   m_kValues[side][pose.sample]);
+    };
     const auto ask = [&](const Vec3& sourceWay, const Vec3& way, double thickness, double share,
                          const Vec3& axis) {
         const double sourceDistance = Vec3Length(sourceWay);
-        any = true;
         const Vec3 direction = Vec3Normalized(fromSourceSide ? way + sourceWay * kSourceSide : way);
         const double now = Vec3Dot(direction, way);
         const double right = RightDistance(now, sourceDistance, thickness);
-        arm.AskDistance(WeightOf(sourceDistance, thickness), way, direction, now + (right - now) * share,
-                        axis);
+        arm().AskDistance(WeightOf(sourceDistance, thickness), way, direction, now + (right - now) * share,
+                          axis);
     };
     for (const Thing& thing : ThingsOf(pose.source, pose.target))
     {
@@ -297,12 +304,11 @@ bool CHandPlan::AddRequests(CArmFit& fit, size_t sample, const Pose& pose, size_
     const auto sourceHeight = static_cast<double>(sourceHand.y);
     const double weight = m_bHasFloor ? WeightOf(sourceHeight, kFloor) : 0.0;
     if (weight > 0.0)
-        arm.Ask(weight, kVec3UnitY, std::max(RightDistance(height, sourceHeight, kFloor), kOnFloor) - height);
+        arm().Ask(weight, kVec3UnitY,
+                  std::max(RightDistance(height, sourceHeight, kFloor), kOnFloor) - height);
     else if (m_bHasFloor && static_cast<double>(pose.target.hands[side].y) < kOnFloor)
-        arm.Ask(1.0, kVec3UnitY, std::max(kOnFloor - height, 0.0));
-    else
-        return any;
-    return true;
+        arm().Ask(1.0, kVec3UnitY, std::max(kOnFloor - height, 0.0));
+    return made.has_value();
 }
 
 // Returns whether the hand is near anything.

@@ -56,8 +56,8 @@ private:
     bool m_bHasFloor = false;
     float m_fRaised = 0.0f; // what to add to the scaled source's heights to put it on the target's floor
     std::vector<Vec3> m_kRoots;
-    std::vector<float> m_kLifts;              // the part of the roots' heights that was added for the legs
-    std::vector<std::vector<Vec3>> m_kAnkles; // by leg and frame; empty if feet are not held
+    std::vector<float> m_kLifts;                // the part of the roots' heights that was added for the legs
+    std::vector<std::vector<Vec3>> m_kAnkles;   // by leg and frame; empty if feet are not held
     std::vector<std::vector<Mat3>> m_kToeTurns; // empty until they are planned
     std::vector<std::vector<float>> m_kLanded;  // confidence that a sole is on the floor
 };

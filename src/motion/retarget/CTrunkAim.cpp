@@ -68,11 +68,13 @@ bool CTrunkAim::FindBones(const CPoseMatcher& matcher, CNode* targetRoot)
         m_apkJoints[i] = FindNode(targetRoot, kTrunkJoints[i]);
         if (!m_apkJoints[i] || (i > 0 && m_apkJoints[i]->GetParentNode() != m_apkJoints[i - 1]))
             return false;
-        if (i < kBones)
-            m_auiBones[i] = static_cast<size_t>(matcher.IndexOf(m_apkJoints[i]));
+        m_auiBones[i] = static_cast<size_t>(matcher.IndexOf(m_apkJoints[i]));
     }
     for (size_t side = 0; side < kHostSides.size(); ++side)
+    {
         m_apkThighs[side] = FindNode(targetRoot, kHostSides[side].thigh);
+        m_auiThighs[side] = static_cast<size_t>(matcher.IndexOf(m_apkThighs[side]));
+    }
     return m_apkThighs[0] && m_apkThighs[1];
 }
 
@@ -111,9 +113,9 @@ void CTrunkAim::PlanRest()
 }
 
 // Returns the same difference for the current pose: it rotates with the source's trunk.
-Mat3 CTrunkAim::RestTurn() const
+Mat3 CTrunkAim::RestTurn(const Vec3& chord) const
 {
-    const Mat3 upright = TurnUpright(Chord(), Vec3Normalized(m_kLine.Across()));
+    const Mat3 upright = TurnUpright(chord, Vec3Normalized(m_kLine.Across()));
     return upright * m_kRestSwing * Mat3Transpose(upright);
 }
 
@@ -123,7 +125,8 @@ void CTrunkAim::PlanHanging(const CPoseMatcher& matcher)
     std::vector<bool> moves(bones.size(), false);
     for (size_t bone = 0; bone < bones.size(); ++bone)
     {
-        const bool isTrunk = std::ranges::find(m_auiBones, bone) != m_auiBones.end();
+        const auto neck = m_auiBones.begin() + kBones;
+        const bool isTrunk = std::find(m_auiBones.begin(), neck, bone) != neck;
         const bool hangs = bones[bone].parent >= 0 && moves[static_cast<size_t>(bones[bone].parent)];
         moves[bone] = isTrunk || (hangs && !bones[bone].posed);
         if (hangs && !isTrunk)
@@ -138,10 +141,9 @@ void CTrunkAim::PlanHanging(const CPoseMatcher& matcher)
 Vec3 CTrunkAim::Pelvis(const CPoseMatcher& matcher) const
 {
     Vec3 hips = kVec3Zero;
-    for (const CNode* thigh : m_apkThighs)
+    for (const size_t bone : m_auiThighs)
     {
         const auto& bones = matcher.Bones();
-        const auto bone = static_cast<size_t>(matcher.IndexOf(thigh));
         const int pelvis = bones[bone].parent;
         if (pelvis < 0 || !bones[static_cast<size_t>(pelvis)].posed ||
             pelvis == static_cast<int>(m_auiBones[0]))
@@ -157,8 +159,9 @@ Vec3 CTrunkAim::Pelvis(const CPoseMatcher& matcher) const
 std::array<Vec3, CTrunkAim::kBones> CTrunkAim::Directions(const Vec3& pelvis) const
 {
     const bool rides = pelvis == kVec3Zero;
-    const Mat3 rest = RestTurn();
-    const Vec3 chord = Turned(Chord(), rest);
+    const Vec3 sourceChord = Chord();
+    const Mat3 rest = RestTurn(sourceChord);
+    const Vec3 chord = Turned(sourceChord, rest);
     std::array<Vec3, kBones> directions;
     Vec3 way = kVec3Zero;
     for (size_t i = 0; i < kBones; ++i)
@@ -185,9 +188,8 @@ void CTrunkAim::TurnTrunk(CPoseMatcher& matcher, const std::array<Vec3, kBones>&
     for (size_t i = 0; i < kBones; ++i)
     {
         CPoseMatcher::Bone& bone = bones[m_auiBones[i]];
-        const auto next = static_cast<size_t>(matcher.IndexOf(m_apkJoints[i + 1]));
         m_kWorlds[m_auiBones[i]] =
-            PointedTo(directions[i], NormalizedRows(bone.world), bones[next].translation);
+            PointedTo(directions[i], NormalizedRows(bone.world), bones[m_auiBones[i + 1]].translation);
         bone.rotation = m_kWorlds[m_auiBones[i]] * Mat3Transpose(above);
         above = m_kWorlds[m_auiBones[i]];
     }

@@ -32,7 +32,7 @@ private:
     void PlanHanging(const CPoseMatcher& matcher);
     Vec3 RestHips() const;
     Vec3 Chord() const;
-    Mat3 RestTurn() const;
+    Mat3 RestTurn(const Vec3& chord) const;
     Vec3 Pelvis(const CPoseMatcher& matcher) const;
     std::array<Vec3, kBones> Directions(const Vec3& pelvis) const;
     void TurnTrunk(CPoseMatcher& matcher, const std::array<Vec3, kBones>& directions);
@@ -40,9 +40,10 @@ private:
     bool m_bIsPlanned = false;
     CTrunkLine m_kLine;
     std::array<CNode*, kBones + 1> m_apkJoints{}; // the target's, from LowerTorso up to the neck
-    std::array<size_t, kBones> m_auiBones{};
-    std::array<double, kBones + 1> m_afShares{}; // of the joints, as fractions of the line
-    std::array<CNode*, 2> m_apkThighs{};         // the target's
+    std::array<size_t, kBones + 1> m_auiBones{};  // of these joints
+    std::array<double, kBones + 1> m_afShares{};  // of the joints, as fractions of the line
+    std::array<CNode*, 2> m_apkThighs{};          // the target's
+    std::array<size_t, 2> m_auiThighs{};
     Mat3 m_kRestSwing = kMat3Identity; // from the source's line at rest to the target's, in trunk axes
     std::vector<size_t> m_kRiders;     // unposed bones attached to the trunk; parents first
     std::vector<size_t> m_kHanging;    // posed bones attached to the trunk or to riders

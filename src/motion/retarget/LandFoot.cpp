@@ -28,6 +28,11 @@ constexpr double kMostSunk = 3.0;     // what sinking adds to the weight of a di
 constexpr double kGlitchSeconds = 1.0 / 30.0;
 constexpr int kLandRounds = 2;
 
+double FourthPower(double x)
+{
+    return x * x * (x * x);
+}
+
 // Returns the median of the values at a frame, before it and after it.
 double SteadyAt(const std::vector<double>& values, size_t frame, size_t apart)
 {
@@ -50,11 +55,11 @@ std::vector<double> LandFoot(std::span<const SoleWish> wishes, double secondsPer
             const SoleWish& wish = wishes[frame];
             const auto sole = static_cast<double>(wish.free);
             const auto share = static_cast<double>(wish.landed);
-            const double hovers = std::pow(share * SteadyAt(heights, frame, apart) / kHover, 4.0);
+            const double hovers = FourthPower(share * SteadyAt(heights, frame, apart) / kHover);
             rise.AddValue(frame, share > 0.0 ? kLandedWeight * (1.0 + hovers) : 0.0, -share * sole);
             rise.AddValue(frame, kAloftWeight * static_cast<double>(wish.aloft),
                           static_cast<double>(std::max(wish.least - wish.free, 0.0f)));
-            const double sinks = std::min(std::pow(std::min(heights[frame], 0.0) / kSunk, 4.0), kMostSunk);
+            const double sinks = std::min(FourthPower(std::min(heights[frame], 0.0) / kSunk), kMostSunk);
             rise.AddValue(frame, kDipWeight * (1.0 + sinks) * Smoothstep(-sole / kFullDip), -sole);
         }
         heights = rise.Solve();
