@@ -356,7 +356,7 @@ bool CObject::AttachModifier(CControl* modifier)
         link->SetTarget(this);
     if (!m_spkModifier)
         m_spkModifier = modifier;
-    else if (last != modifier)
+    else if (last && last != modifier)
         last->SetNext(modifier);
     return true;
 }

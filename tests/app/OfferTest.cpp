@@ -5,6 +5,7 @@
 #include "CProfileEditorDialog.h"
 #include "Paths.h"
 
+#include <algorithm>
 #include <gmock/gmock.h>
 #include <thread>
 
@@ -18,9 +19,8 @@ const SourceBones kOtherBones{"rig:Hips",       "rig:LeftUpLeg", "rig:LeftLeg", 
 
 std::vector<ERemedy> RemediesOf(const std::vector<Offer>& offers)
 {
-    std::vector<ERemedy> remedies;
-    for (const Offer& offer : offers)
-        remedies.push_back(offer.remedy);
+    std::vector<ERemedy> remedies(offers.size());
+    std::ranges::transform(offers, remedies.begin(), &Offer::remedy);
     return remedies;
 }
 

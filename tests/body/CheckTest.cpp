@@ -83,7 +83,7 @@ TEST(CheckBody, DoubtsMapsThatAreWrong)
             CBodyMap body = FindBodyByShape(made.Root());
             spoil(body);
             const std::vector<BodyDoubt> doubts = CheckBody(body);
-            EXPECT_TRUE(std::ranges::any_of(doubts, [&](const BodyDoubt& doubt) {
+            EXPECT_TRUE(std::ranges::any_of(doubts, [kind = kind, joint = joint](const BodyDoubt& doubt) {
                 return doubt.kind == kind && doubt.place.joint == joint;
             }));
         }
@@ -251,7 +251,7 @@ TEST(FindBody, FindsNoneWhereNoneIs)
         SCOPED_TRACE(what);
         Ref<CNode> root = new CNode;
         CNode* end = root.Get();
-        const auto hang = [&](CNode* parent) {
+        const auto hang = [bone = bone](CNode* parent) {
             CNode& node = AttachNode(*parent);
             node.m_kMatrix.SetTranslation({0.0f, bone, 0.0f});
             return &node;

@@ -54,7 +54,7 @@ protected:
     static std::string Opened()
     {
         EXPECT_TRUE(WaitUntil([] { return FileExists(OpenedFile()); }));
-        const std::string opened = ReadBytes(OpenedFile());
+        std::string opened = ReadBytes(OpenedFile());
         DeleteFile(OpenedFile());
         return opened;
     }

@@ -26,7 +26,8 @@ public:
     {
         QObject::connect(&model, &QAbstractItemModel::rowsInserted, &model,
                          [this](const QModelIndex&, int first, int last) {
-                             m_kRows.insert(m_kRows.begin() + first, size_t(last - first + 1), {});
+                             m_kRows.insert(m_kRows.begin() + first,
+                                            static_cast<size_t>(last) - static_cast<size_t>(first) + 1, {});
                              Take(first, last);
                          });
         QObject::connect(&model, &QAbstractItemModel::rowsRemoved, &model,
@@ -55,6 +56,7 @@ private:
 std::vector<std::string> RowsOf(const CMapRowTable& table)
 {
     std::vector<std::string> rows;
+    rows.reserve(static_cast<size_t>(table.RowCount()));
     for (int row = 0; row < table.RowCount(); ++row)
         rows.push_back(RowText([&](int column) { return table.Text(row, column); }));
     return rows;

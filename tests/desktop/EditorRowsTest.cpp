@@ -9,7 +9,6 @@
 namespace gw {
 
 using testing::ElementsAre;
-using testing::IsEmpty;
 
 namespace {
 
