@@ -39,7 +39,7 @@ namespace {
 // In millimeters of the target. A gap is the distance minus the thickness of the thing.
 constexpr double kTouch = 50.0; // up to this gap, a touch counts in full, apart from kNear
 constexpr double kNear = 50.0;  // the factor for near gaps is 1/2 at this gap
-constexpr double kFade = 15.0;  // over this distance beyond kTouch, a touch fades out
+constexpr double kFade = 7.0;   // over this distance beyond kTouch, a touch fades out
 constexpr double kThigh = 40.0; // thickness: from the middle of a thing to a wrist that lies on it
 constexpr double kTrunk = 60.0;
 constexpr double kHead = 70.0;
@@ -54,7 +54,7 @@ constexpr double kRightGap = 4.0;
 constexpr double kRightShare = 0.2;
 
 // A gap that is wrong by this much costs as much as bones that are off by a radian.
-constexpr double kGapScale = 32.0;
+constexpr double kGapScale = 26.0;
 // Of the rotation vector, the elbow's bend, and the shoulder's shift upward.
 constexpr CArmFit::Values kArmScales = {2.0, 2.0, 2.0, 0.5, 1.5};
 constexpr double kHandHertz = 5.0; // arms swing past a thigh fast: the turn must be gone before the hand is
