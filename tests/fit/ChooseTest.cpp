@@ -41,13 +41,14 @@ protected:
     /// Writes a profile that drives the hips, with additional rows.
     std::string Profile(const std::string& name, const std::string& rows)
     {
-        const std::string path = m_kFolder.Path(name + ".prf");
+        std::string path = m_kFolder.Path(name + ".prf");
         WriteBytes(path, name + "\nFrameRate 30\nPosition 0 0 0\nHips <---> LowerTorso 0,0,0,1,2,3\n" + rows);
         return path;
     }
     static std::vector<std::string> Names(const std::vector<ProfileChoice>& choices)
     {
         std::vector<std::string> names;
+        names.reserve(choices.size());
         for (const ProfileChoice& choice : choices)
             names.push_back(choice.profile.name);
         return names;
