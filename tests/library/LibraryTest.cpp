@@ -78,7 +78,9 @@ TEST_F(Library, WritesWhatTheShellWrites)
         {
             SCOPED_TRACE(std::string(row.arguments) + extension);
             const std::string name = std::string("shell") + extension;
-            ASSERT_TRUE(RunShell("convert " + kWalk + " --force -o " + name + ' ' + row.arguments));
+            std::string line = "convert ";
+            line.append(kWalk).append(" --force -o ").append(name).append(" ").append(row.arguments);
+            ASSERT_TRUE(RunShell(line));
             const Outcome<Conversion> conversion = Convert(walk, row.options);
             ASSERT_TRUE(conversion) << Line(conversion.Error());
             EXPECT_TRUE(conversion->Check()) << "a check before saving changes nothing";

@@ -121,6 +121,7 @@ TEST(Threads, ConvertDifferentMotionsAtTheSameTime)
     const gw::CTempFolder folder;
     const std::vector<Task> tasks = TasksIn(folder);
     std::vector<Yield> expected;
+    expected.reserve(tasks.size());
     for (const Task& task : tasks)
         expected.push_back(DoTask(task, folder.Path("single.htr")));
     EXPECT_FALSE(expected[0].bytes.empty());
@@ -139,11 +140,13 @@ TEST(Threads, UseOneMotionAtTheSameTime)
     const gw::CTempFolder folder;
     const std::vector<Task> tasks = TasksIn(folder);
     std::vector<Yield> expected;
+    expected.reserve(tasks.size());
     for (const Task& task : tasks)
         expected.push_back(YieldOf(*Load(tasks[0].path), task));
     const Outcome<Motion> shared = Load(tasks[0].path);
     ASSERT_TRUE(shared);
     RunThreads([&](size_t thread) {
+        // NOLINTNEXTLINE(performance-unnecessary-copy-initialization): each thread has its own handle
         const Motion own = *shared;
         EXPECT_EQ(YieldOf(own, tasks[thread]), expected[thread]);
         EXPECT_EQ(own.Poses()->data(), shared->Poses()->data()) << "computed once";
@@ -161,6 +164,7 @@ TEST(Threads, UseOneConversionAtTheSameTime)
     RunThreads([&](size_t thread) {
         const Conversion own = *handles[thread];
         handles[thread].reset();
+        // NOLINTNEXTLINE(performance-unnecessary-copy-initialization): as above
         const Motion result = own.Result();
         EXPECT_TRUE(own.Check());
         EXPECT_EQ(*own.Bytes("Kinetra"), expected);

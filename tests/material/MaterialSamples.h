@@ -78,7 +78,7 @@ inline Ref<CImage> Halves(int32_t format = 0)
     const auto bytes = static_cast<size_t>(pixels.GetBytesPerPixel());
     const CPixelLock lock(pixels);
     for (int32_t i = 0; i < 64; ++i)
-        std::memcpy(lock.Row(i / 8) + (8 + i % 8) * pixels.GetBytesPerPixel(), orange, bytes);
+        std::memcpy(lock.Row(i / 8) + static_cast<size_t>(8 + i % 8) * bytes, orange, bytes);
     return image;
 }
 
@@ -89,7 +89,7 @@ inline bool ShowsHalves(CImage& image, int tolerance)
     if (pixels.GetWidth() != 16 || pixels.GetHeight() != 8 || pixels.GetFormat() != 0)
         return false;
     const auto isNear = [&](int32_t x, std::initializer_list<int> color) {
-        const uint8_t* byte = view.Row(5) + x * 4;
+        const uint8_t* byte = view.Row(5) + std::ptrdiff_t{4} * x;
         return std::ranges::all_of(color, [&](int c) { return std::abs(*byte++ - c) <= tolerance; });
     };
     return isNear(2, {250, 20, 10, 255}) && isNear(13, {10, 120, 240, 255});

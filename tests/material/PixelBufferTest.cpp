@@ -175,15 +175,16 @@ TEST(Blit, IsCutToBothPictures)
     CPixelBuffer source;
     source.Create(3, 3, 1);
     for (int32_t i = 0; i < 9; ++i)
-        CPixelLock(source).Row(i / 3)[i % 3 * 3] = static_cast<uint8_t>(i + 1);
+        CPixelLock(source).Row(i / 3)[size_t{3} * (i % 3)] = static_cast<uint8_t>(i + 1);
     for (const auto& [what, x, y, sourceX, sourceY, width, height, wanted] : rows)
     {
         CPixelBuffer destination;
         destination.Create(4, 3, 0);
         EXPECT_TRUE(Blit(destination, x, y, source, sourceX, sourceY, width, height, 255));
         std::vector<int> blues;
+        blues.reserve(12);
         for (int32_t i = 0; i < 12; ++i)
-            blues.push_back(CPixelView(destination).Row(i / 4)[i % 4 * 4]);
+            blues.push_back(CPixelView(destination).Row(i / 4)[size_t{4} * (i % 4)]);
         EXPECT_EQ(blues, wanted) << what;
     }
 }
@@ -193,7 +194,7 @@ TEST(Blit, OverlappingPartsOfOnePictureAreTakenAsTheyWere)
     CPixelBuffer buffer;
     buffer.Create(4, 1, 1);
     for (int32_t x = 0; x < 4; ++x)
-        CPixelLock(buffer).Row(0)[x * 3] = static_cast<uint8_t>(x + 1);
+        CPixelLock(buffer).Row(0)[size_t{3} * x] = static_cast<uint8_t>(x + 1);
     EXPECT_TRUE(Blit(buffer, 1, 0, buffer, 0, 0, 3, 1, 255));
     EXPECT_THAT(BytesOf(buffer), ElementsAre(1, 0, 0, 1, 0, 0, 2, 0, 0, 3, 0, 0));
 }

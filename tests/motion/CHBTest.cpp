@@ -136,7 +136,7 @@ TEST(TKCHBStream, TakesTheBeginFrameTwice)
 TEST(TKCHBStream, ReadsOddFilesAsTheyStand)
 {
     const std::string plain = SmallCHB(0, 3);
-    const size_t parent = kFirstName + 2 * 260 + 11 + 3 * 256; // of the head
+    const size_t parent = kFirstName + size_t{2} * 260 + 11 + size_t{3} * 256; // of the head
     const Patch rows[] = {
         {"a header's keyword in another case", 0, "[header]", "", "Torso(Head)"},
         {"a frame's keyword in another case", kFirstFrame - 5, "fRAME", "", "Torso(Head)"},
@@ -196,7 +196,7 @@ TEST(TKCHBStream, RefusesWithReasonAndByte)
         int line = 0;
         EXPECT_EQ(std::sscanf(error->where, "TKCHBStream Line:%d", &line), 1) << error->where;
     }
-    const std::string noRoot = Patched(plain, kFirstName + 2 * 260 + 11 + 256, Name("Head"));
+    const std::string noRoot = Patched(plain, kFirstName + size_t{2} * 260 + 11 + 256, Name("Head"));
     EXPECT_EQ(RecordText(CLoadedMotion(noRoot, "a.chb").motion.Record()), "failed NoRoot 2074 Global\n");
 }
 

@@ -247,6 +247,7 @@ TEST(SmoothCurve, KeepsPlaceAndSumOfAPeakAndTheEndsOfALine)
 TEST(SmoothCurve, SteadySidesSlowDownTheTurnOfANearlyStraightKnee)
 {
     std::vector<Vec3> sides;
+    sides.reserve(62);
     for (int frame = 0; frame < 60; ++frame)
         sides.push_back({std::clamp(static_cast<float>(frame - 30), -5.0f, 5.0f) * 4.0f, 0.0f, 5.0f});
     sides.push_back({0.0f, 360.0f, 0.0f});

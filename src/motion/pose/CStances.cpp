@@ -9,7 +9,6 @@
 #include "Skeleton.h"
 
 #include <algorithm>
-#include <ranges>
 
 namespace gw {
 
@@ -56,9 +55,10 @@ std::vector<Vec3> TipsOf(const std::vector<CNode*>& joints)
 {
     constexpr double kMostTip = 1.5; // longest bones
     double longest = 0.0;
-    for (const CNode* joint : joints | std::views::drop(1))
-        longest = std::max<double>(longest, Vec3Length(RestLocal(*joint).Translation()));
+    for (size_t i = 1; i < joints.size(); ++i)
+        longest = std::max<double>(longest, Vec3Length(RestLocal(*joints[i]).Translation()));
     std::vector<Vec3> tips;
+    tips.reserve(joints.size());
     for (const CNode* joint : joints)
     {
         const Vec3 tip = joint->HasNoNodeChild() ? NodeBoneEnd(*joint) : kVec3Zero;
