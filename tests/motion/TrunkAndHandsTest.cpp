@@ -129,7 +129,7 @@ TEST(CHandPlan, HandsKeepTheirGapsAndOthersTheirPaths)
     // hands of the source and the target's left hand; left: the gap of the first one to what it touches
     const std::tuple<const char*, Vec3, Vec3, Vec3, double> rows[] = {
         {"on a thigh", {95.0f, 510.0f, 250.0f}, away, overThigh, 60.0},
-        {"on the floor", {400.0f, 40.0f, 250.0f}, away, {170.0f, 160.0f, 100.0f}, 40.0},
+        {"in the floor", {400.0f, -30.0f, 250.0f}, away, {170.0f, 160.0f, 100.0f}, 20.0},
         {"that clap", {30.0f, 900.0f, 400.0f}, {-30.0f, 900.0f, 400.0f}, overThigh, 60.0},
         {"at the head", {0.0f, 1297.0f, 90.0f}, away, {60.0f, 1200.0f, 240.0f}, 90.0},
         {"far from it all", {400.0f, 700.0f, 400.0f}, away, overThigh, -1.0},

@@ -135,7 +135,8 @@ double RightDistance(double distance, double source, double thickness)
 {
     const double gap = std::max(source - thickness, 0.0);
     const double slack = kRightGap + kRightShare * gap + std::max(gap - kTouch, 0.0);
-    return std::clamp(distance, std::max(source - slack, 0.0), source + slack);
+    const double least = std::max(source - slack, 0.0);
+    return std::clamp(distance, least, std::max(source + slack, least)); // a height can be below the floor
 }
 
 // Adds an arm's requests of one sample to the fit.
