@@ -46,7 +46,8 @@ TEST(Player, StoresEveryPointOfEveryFrame)
     static const std::regex kPositions("\"positions\":\"([^\"]*)\"");
     std::smatch positions;
     ASSERT_TRUE(std::regex_search(page, positions, kPositions));
-    EXPECT_EQ(positions[1].length(), (2 * 3 * points * 40 + 2) / 3 * 4) << "two bytes per coordinate";
+    EXPECT_EQ(positions[1].length(), (std::ptrdiff_t{2} * 3 * points * 40 + 2) / 3 * 4)
+        << "two bytes per coordinate";
     EXPECT_NE(page.find("\"marks\":[[3,1]]"), page.npos);
     EXPECT_NE(page.find(",1]"), page.npos) << "bones of the left side";
     EXPECT_NE(page.find(",2]"), page.npos) << "bones of the right side";

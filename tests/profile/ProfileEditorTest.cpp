@@ -6,8 +6,6 @@
 
 namespace gw {
 
-using testing::ElementsAre;
-
 namespace {
 
 std::string Joined(const std::vector<std::string>& messages)

@@ -6,8 +6,6 @@
 
 namespace gw {
 
-using testing::ElementsAre;
-
 namespace {
 
 class ProfileUndo : public ProfileEditor

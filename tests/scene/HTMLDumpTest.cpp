@@ -70,7 +70,7 @@ std::string Table(const char* className, const std::vector<std::pair<std::string
     std::string text = std::string("<H1>") + className +
                        "</H1>\n<HR>\n<TABLE BORDER=\"3\"><CAPTION>\xA6\xA8\xAD\xFB\xB8\xEA\xAE\xC6\n";
     for (const auto& [name, value] : rows)
-        text += "<TR><TH>" + name + "</TH><TD>" + value + "</TD></TR>\n";
+        text.append("<TR><TH>").append(name).append("</TH><TD>").append(value).append("</TD></TR>\n");
     return text + "</CAPTION></TABLE>\n";
 }
 
