@@ -120,6 +120,7 @@ class Program(unittest.TestCase):
         self.assertIsNone(first.poll())
 
     def test_a_counter_left_by_a_crash_is_named_and_reset(self):
+        self.home.run("--reset-instance-counter")  # the counter is the user's, and may have been left before
         first = self.home.start()
         self.wait_for_socket()
         first.kill()
