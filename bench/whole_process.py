@@ -56,7 +56,7 @@ def compare(name, path, ours, others, runs):
 
 
 def installed(build, folder):
-    """Copies the built programs with their files, as an installation does, and returns the copy.
+    """Copies the built programs and their files to a folder, like an installer, and returns the path of the copy.
 
     A linker writes a program in many small pieces, and the system keeps it in memory as such until it is read from the
     disk again. Starting it then takes longer, by 0.05 of the time of a small load.

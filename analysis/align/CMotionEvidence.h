@@ -26,7 +26,7 @@ class CMotionEvidence
 {
 public:
     /// Examines the motion at thirty frames per second, or all frames if there are fewer. `worldTurn` rotates
-    /// it so that Y is up. Without `seeksFrame`, no reference frame is looked for.
+    /// it so that Y is up. `seeksFrame` says whether to find the reference frame, too.
     CMotionEvidence(const BodyMotion& motion, const Mat3& worldTurn, std::span<const LooseWay> ways,
                     bool seeksFrame);
 
@@ -39,7 +39,7 @@ public:
     }
     /// Returns the mean direction of a loose way in the space of its joint; nothing for other joints.
     std::optional<Vec3> MeanWay(const CNode& from) const;
-    /// Returns the frame closest to a reference pose; -1 if none was looked for or there are no frames.
+    /// Returns the frame closest to a reference pose; -1 without `seeksFrame` or in a motion without frames.
     int ReferenceFrame() const { return m_iReferenceFrame; }
 
 private:

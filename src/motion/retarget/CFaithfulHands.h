@@ -16,8 +16,8 @@ namespace gw {
 class CFaithfulHands
 {
 public:
-    /// Plans both arms, or neither if there is no root or if an arm or a leg is not mapped. Without a mapped
-    /// neck, the trunk ends at the head. Both trees must be in rest pose.
+    /// Plans both arms. If the root, an arm or a leg is missing or not mapped, neither arm is moved. If the
+    /// neck is not mapped, the trunk ends at the head. Both trees must be in rest pose.
     CFaithfulHands(const CRetargeter& retargeter, CPoseMatcher& matcher, CNode* targetRoot,
                    const std::vector<CFaithfulLeg>& legs);
 

@@ -124,7 +124,7 @@ ToePlace CFaithfulPose::ToeMoved(size_t leg, size_t frame, double flatDrop) cons
         return {0.0, std::numeric_limits<double>::quiet_NaN()};
     const ToePlace place = ToePlaceOf(track.Toes()[frame] - track.Ankles()[frame]);
     const double square = place.ahead * place.ahead + place.height * place.height - flatDrop * flatDrop;
-    const double scale = (lengths.upper + lengths.lower) / m_kSource.LegLength();
+    const double scale = lengths.Straight() / m_kSource.LegLength();
     return {(place.ahead - std::sqrt(std::max(square, 0.0))) * scale, (place.height + flatDrop) * scale};
 }
 
@@ -137,7 +137,7 @@ void CFaithfulPose::SettleFeet(double secondsPerFrame, double flatDrop)
         CFaithfulLeg& of = m_kLegs[leg];
         if (!of.HasToe())
             continue;
-        const double length = of.Lengths().upper + of.Lengths().lower;
+        const double length = of.Lengths().Straight();
         const FootTouches& touch = m_kSource.Touches()[leg];
         std::vector<ToeWish> wishes;
         for (size_t frame = 0; frame < m_kSource.FrameCount(); ++frame)
@@ -165,7 +165,7 @@ void CFaithfulPose::YieldFeet(double secondsPerFrame, double flatDrop)
         const CLegTrack& track = m_kSource.Leg(leg);
         if (!track.HasToe() || !of.HasToe())
             continue;
-        const double length = of.Lengths().upper + of.Lengths().lower;
+        const double length = of.Lengths().Straight();
         const auto scale = static_cast<float>(length / m_kSource.LegLength());
         std::vector<Vec3> toe;
         std::vector<Vec3> sourceAnkle;

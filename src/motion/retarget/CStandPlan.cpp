@@ -52,7 +52,7 @@ double ScaleOf(const std::vector<CFaithfulLeg>& legs, double sourceLeg)
 {
     CRunningMean lengths;
     for (const CFaithfulLeg& leg : legs)
-        lengths.Add(leg.Lengths().upper + leg.Lengths().lower);
+        lengths.Add(leg.Lengths().Straight());
     const double scale = lengths.Mean() / sourceLeg;
     return std::isfinite(scale) ? scale : 1.0;
 }
@@ -181,7 +181,7 @@ void CStandPlan::HoldLeg(size_t leg, const FootTouches& touches, double secondsP
     std::vector<Vec3> sourceToe = Scaled(track.Toes());
     for (size_t frame = sourceToe.size(); frame < sourceAnkle.size(); ++frame)
         sourceToe.push_back(sourceAnkle[frame] + toe[frame]);
-    const double length = legs_[leg].Lengths().upper + legs_[leg].Lengths().lower;
+    const double length = legs_[leg].Lengths().Straight();
     const StandingFoot standing =
         StandSteps({toe, sourceAnkle, sourceToe, length},
                    {touches.contacts, touches.ankle, touches.toe, source_.Jumps()}, secondsPerFrame);
@@ -203,7 +203,7 @@ SoleWish CStandPlan::WishedSole(size_t leg, size_t frame, const FootTouches& tou
 {
     const CFaithfulLeg& of = legs_[leg];
     const FootState& state = touches.states[frame];
-    const double length = of.Lengths().upper + of.Lengths().lower;
+    const double length = of.Lengths().Straight();
     const float free = FreeSole(leg, frame);
     const float pitched = of.At(frame).sole - std::min(of.AnkleHeight(), of.ToeSole(frame));
     const double height = static_cast<double>(state.height) + kAloftMargin;

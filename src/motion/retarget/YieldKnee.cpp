@@ -45,7 +45,7 @@ double BendFor(const LegLengths& leg, double bend, double slowBelow, double stif
 
 double SquareReachAt(const LegLengths& leg, double bend)
 {
-    const double straight = leg.upper + leg.lower;
+    const double straight = leg.Straight();
     return straight * straight - 4.0 * leg.upper * leg.lower * bend * bend;
 }
 
@@ -58,7 +58,7 @@ double ReachAt(const LegLengths& leg, double bend)
 
 double BendAt(const LegLengths& leg, double reach)
 {
-    const double straight = leg.upper + leg.lower;
+    const double straight = leg.Straight();
     const double square = (straight * straight - reach * reach) / (4.0 * leg.upper * leg.lower);
     return std::sqrt(std::clamp(square, 0.0, 1.0));
 }
@@ -72,7 +72,7 @@ double SquareSlopeAt(const LegLengths& leg, double bend)
 
 double YieldingBend(const LegLengths& leg, double asked, double bend, double stiffness)
 {
-    const double shorter = ReachAt(leg, bend) - std::clamp(asked, 0.0, 2.0 * (leg.upper + leg.lower));
+    const double shorter = ReachAt(leg, bend) - std::clamp(asked, 0.0, 2.0 * leg.Straight());
     const double direction = shorter < 0.0 ? -1.0 : 1.0;
     const double slowBelow = std::max(std::min(kStopBend, bend), 1e-9);
     const double step = std::fabs(shorter) / kSteps;

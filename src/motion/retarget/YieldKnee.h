@@ -7,6 +7,9 @@ struct LegLengths
 {
     double upper;
     double lower;
+
+    /// Returns the length of the straight limb.
+    double Straight() const { return upper + lower; }
 };
 
 // The bend of a knee is the sine of half its angle: 0 for a straight leg, 1 for a folded one.
